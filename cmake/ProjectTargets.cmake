@@ -1,0 +1,55 @@
+# Settings that every target shares, and the few functions that make targets.
+
+set(CMAKE_CXX_STANDARD 17)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_POSITION_INDEPENDENT_CODE ON)
+set(CMAKE_CXX_VISIBILITY_PRESET hidden)
+set(CMAKE_VISIBILITY_INLINES_HIDDEN ON)
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+
+# What a user runs lies flat in the build folder; the module has a folder of
+# its own with its data files beside it.
+set(CMAKE_RUNTIME_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR})
+set(CMAKE_LIBRARY_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR})
+set(CLIPHOST_PLUGIN_DIR ${PROJECT_BINARY_DIR}/plugins)
+set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
+
+find_program(CCACHE ccache)
+if(CCACHE)
+  set(CMAKE_CXX_COMPILER_LAUNCHER ${CCACHE})
+endif()
+
+add_library(project_options INTERFACE)
+target_include_directories(project_options INTERFACE ${PROJECT_SOURCE_DIR})
+target_compile_options(project_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wvla
+  -Wnon-virtual-dtor -Werror=format -Werror=return-type)
+if(CLIPHOST_SANITIZE)
+  target_compile_options(project_options INTERFACE -fsanitize=${CLIPHOST_SANITIZE}
+    -fno-sanitize-recover=all -fno-omit-frame-pointer)
+  target_link_options(project_options INTERFACE -fsanitize=${CLIPHOST_SANITIZE})
+endif()
+if(CLIPHOST_FUZZ)
+  target_compile_options(project_options INTERFACE -fsanitize=fuzzer-no-link)
+endif()
+
+# project_library(NAME SOURCES file... [PUBLIC target...] [PRIVATE target...])
+# One static library for one folder, linked into the module, the host or tests.
+function(project_library name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
+  add_library(${name} STATIC ${ARG_SOURCES})
+  target_link_libraries(${name} PUBLIC project_options host_interfaces ${ARG_PUBLIC}
+                                PRIVATE ${ARG_PRIVATE})
+endfunction()
+
+# project_test(NAME SOURCES file... LIBS target... [LABELS label...])
+# A GoogleTest program; each of its tests is one of ctest's.
+function(project_test name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;LIBS;LABELS" ${ARGN})
+  add_executable(${name} ${ARG_SOURCES})
+  target_link_libraries(${name} PRIVATE project_options ${ARG_LIBS} GTest::gtest GTest::gmock
+                                        GTest::gtest_main)
+  set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR}/tests)
+  gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60
+                       PROPERTIES TIMEOUT 300 LABELS "${ARG_LABELS}")
+endfunction()

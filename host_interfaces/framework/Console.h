@@ -1,0 +1,31 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "host_interfaces/framework/Unknown.h"
+
+#if defined(__MINGW32__)
+#define NCF_PRINTF(text, first) __attribute__((format(__MINGW_PRINTF_FORMAT, text, first)))
+#elif defined(__GNUC__)
+#define NCF_PRINTF(text, first) __attribute__((format(printf, text, first)))
+#else
+#define NCF_PRINTF(text, first)
+#endif
+
+// The user's console. Levels in use: 1 failures shown to the user, 2 notices,
+// 4 details. Thread-safe. Obtained by QueryInterface on the host unknown.
+struct INCFConsole : INCFUnknown {
+    virtual NCFRESULT ReservedConsoleOperationA() = 0;  // 3
+    virtual NCFRESULT ReservedConsoleOperationB() = 0;  // 4
+    // 5. Writes a formatted line; texts are UTF-8. Text that comes from a file
+    // is an argument, never the format.
+    virtual NCFRESULT Write(ncfUInt32 level, const char* format, ...) NCF_PRINTF(3, 4) = 0;
+
+protected:
+    ~INCFConsole() = default;
+};
+
+inline constexpr GUID IID_INCFConsole = ncfGuid("908C3A6B-F119-11D6-AD24-00039383008C");
+constexpr const GUID& ncfIdOf(const INCFConsole*) {
+    return IID_INCFConsole;
+}

@@ -1,0 +1,30 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "host_interfaces/framework/HostSettings.h"
+
+// What the editor's project says about clips that are described for it.
+struct INCFNMAEditorSettings : INCFUnknown {
+    // 3. Frames per second of the project; two further outputs have no use yet.
+    virtual NCFRESULT GetEditorFrameRate(double* rate, ncfUInt32* reservedA,
+                                         ncfUInt32* reservedB) = 0;
+    // 4. Length given to one-frame clips, in edit units.
+    virtual NCFRESULT GetSingleFrameDuration(ncfUInt32* duration) = 0;
+    // 5. Whether clips take `rate`, frames per second, instead of their own.
+    virtual NCFRESULT GetForcedFrameRate(ncfUInt32* enabled, double* rate) = 0;
+    virtual NCFRESULT ReservedEditorSetting() = 0;  // 6
+    // 7. A setting by its 8-bit key. The caller zeroes the outputs; the last
+    // two may be null. Not set: NCF_E_PARAMETERNOTAVAILABLE.
+    virtual NCFRESULT GetNamedSetting(const ncfUTF8* key, ncfUInt32* value, ncfUInt64* out2,
+                                      void* out3) = 0;
+
+protected:
+    ~INCFNMAEditorSettings() = default;
+};
+
+inline constexpr GUID IID_INCFNMAEditorSettings = ncfGuid("69A8F0F3-C6E4-4666-A3DD-8F24F50FC1E4");
+inline constexpr const GUID& COMPID_INCFNMAEditorSettings = NMA::Impl::CompID_HostSettings;
+constexpr const GUID& ncfIdOf(const INCFNMAEditorSettings*) {
+    return IID_INCFNMAEditorSettings;
+}

@@ -1,0 +1,18 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "host_interfaces/util/NMAString.h"
+
+// Helpers over texts and paths. A path may hold slashes of either kind.
+class NMAUTIL_API NMAStringUtils {
+public:
+    // `length` wide characters, or all up to the terminator with -1.
+    static NMAString CreateWCharNMAString(const wchar_t* text, ncfSInt32 length);
+    // The path up to and including its last separator; empty without one.
+    static NMAString GetParentFolder(const NMAString& path);
+    // Folder and name joined with a backslash unless the folder ends in a
+    // separator already. An empty folder gives the name.
+    static NMAString CombinePath(const NMAString& folder, const NMAString& name);
+    static bool IsStartWith(const NMAString& text, const char* start);
+};
