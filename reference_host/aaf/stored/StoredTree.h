@@ -1,0 +1,87 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <array>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+// The neutral form between a compound file and the object model: a tree of
+// objects whose properties are bytes, contained objects or references by key.
+// Nothing here knows an AAF class; the reader makes such a tree of any
+// well-formed file and the writer lays any such tree out.
+
+namespace aaf::stored {
+
+using Bytes = std::vector<std::uint8_t>;
+
+// Sixteen bytes as they stand in the file: the first three fields of the text
+// form little-endian, the other eight in order.
+using StoredAuid = std::array<std::uint8_t, 16>;
+
+enum class SectorSize : std::uint32_t { Bytes512 = 512, Bytes4096 = 4096 };
+
+enum class StoredForm : std::uint16_t {
+    WeakReference = 0x02,
+    WeakVector = 0x12,
+    WeakSet = 0x1A,
+    StrongReference = 0x22,
+    StrongVector = 0x32,
+    StrongSet = 0x3A,
+    Stream = 0x42,
+    Data = 0x82,
+};
+
+struct StoredProperty;
+
+// One object: a storage of the file. Every pid occurs once among the
+// properties, whose order is the order in the file.
+struct StoredObject {
+    StoredAuid classId{};
+    std::vector<StoredProperty> properties;
+
+    const StoredProperty* find(std::uint16_t pid) const;
+};
+
+// One property. Which fields count is told by the form.
+struct StoredProperty {
+    std::uint16_t pid = 0;
+    StoredForm form = StoredForm::Data;
+
+    // Name of the property, of which the names of storages and streams are
+    // made (strong forms, weak collections, streams; unused otherwise). After
+    // reading it is the part of the stored name before the pid, which may be
+    // a squeezed form of the property's name.
+    std::u16string name;
+
+    // Data: the value, 1 to 65535 bytes (an empty value is written as an
+    // absent property). Stream: the content. Of a form that is not listed
+    // above: the value as it stands.
+    Bytes bytes;
+
+    // Strong forms: the contained objects in order; exactly one for a strong
+    // reference.
+    std::vector<StoredObject> objects;
+
+    // Strong set: the key of each object, beside `objects` (the object also
+    // stores it as its own property `keyPid`). Weak forms: the keys of the
+    // targets; exactly one for a weak reference. Keys have 16 or 32 bytes.
+    std::vector<Bytes> keys;
+    std::uint16_t keyPid = 0;
+
+    // Weak forms: the pids from the root object down to the strong set that
+    // holds the targets. Empty after reading when the file names no such path.
+    std::vector<std::uint16_t> targetPath;
+};
+
+bool operator==(const StoredObject& left, const StoredObject& right);
+bool operator==(const StoredProperty& left, const StoredProperty& right);
+inline bool operator!=(const StoredObject& left, const StoredObject& right) {
+    return !(left == right);
+}
+inline bool operator!=(const StoredProperty& left, const StoredProperty& right) {
+    return !(left == right);
+}
+
+}  // namespace aaf::stored
