@@ -1,0 +1,64 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "source/plugin/PluginLogSink.h"
+
+#include "source/plugin/ResultChecks.h"
+
+namespace {
+
+slog::CLoggerBaseEx* MakeDiscardingLogger() {
+    return new slog::CNullLoggerEx;
+}
+
+}  // namespace
+
+PluginLogSink& PluginLogSink::Instance() {
+    static PluginLogSink* const sink = new PluginLogSink;
+    return *sink;
+}
+
+PluginLogSink::PluginLogSink() : current_(&discard_), maker_(MakeDiscardingLogger) {}
+
+void PluginLogSink::Start(INCFComponentFactory* factory) {
+    if (started_.load(std::memory_order_relaxed)) {
+        return;
+    }
+    ThrowIfFailed(ncfCreate(factory, CompID_LockComponent, IID_LockComponent, lock_));
+    started_.store(true, std::memory_order_relaxed);
+}
+
+void PluginLogSink::Stop() {
+    lock_ = nullptr;
+    started_.store(false, std::memory_order_relaxed);
+}
+
+slog::CLoggerBaseEx& PluginLogSink::Begin(ncfUInt64 mask, const char* where, ncfUInt32 kind) {
+    if (!started_.load(std::memory_order_relaxed) || (mask & mask_) == 0 ||
+        kind == slog::kNoRecord) {
+        current_.store(&discard_, std::memory_order_relaxed);
+        return discard_;
+    }
+    lock_->Lock();
+    if (!logger_) {
+        logger_.reset(maker_());
+    }
+    slog::CLoggerBaseEx& chosen = *logger_;
+    current_.store(&chosen, std::memory_order_relaxed);
+    chosen.BeginRecord(kind, where);
+    lock_->Unlock();
+    return chosen;
+}
+
+PluginLogSink::LoggerMaker PluginLogSink::SetLoggerMaker(LoggerMaker maker) {
+    current_.store(&discard_, std::memory_order_relaxed);
+    logger_.reset();
+    return std::exchange(maker_, maker ? maker : MakeDiscardingLogger);
+}
+
+slog::Record::Record(ncfUInt32 kind, const char* where)
+    : logger_(PluginLogSink::Instance().Begin(kMaskChecks, where, kind)) {
+    if (kind == kError) {
+        logger_.SetFlag(1);
+    }
+}
