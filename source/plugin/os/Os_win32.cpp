@@ -1,0 +1,184 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// The operating system, by its calls on 64-bit Windows.
+
+#include <windows.h>
+
+#include <malloc.h>
+
+#include "source/plugin/os/Os.h"
+
+namespace os {
+namespace {
+
+HANDLE AsHandle(FileHandle file) {
+    return reinterpret_cast<HANDLE>(file);
+}
+
+const wchar_t* Wide(const std::u16string& text) {
+    return reinterpret_cast<const wchar_t*>(text.c_str());
+}
+
+// The root that the query for the sector size wants: a drive's first three
+// characters, or a share's up to its fourth backslash.
+std::u16string VolumeRoot(const std::u16string& path) {
+    if (path.size() >= 3 && path[1] == u':' && path[2] == u'\\') {
+        return path.substr(0, 3);
+    }
+    if (path.compare(0, 2, u"\\\\") != 0) {
+        return {};
+    }
+    const std::size_t third = path.find(u'\\', 3);
+    const std::size_t fourth =
+        third == std::u16string::npos ? third : path.find(u'\\', third + 1);
+    return fourth == std::u16string::npos ? std::u16string() : path.substr(0, fourth + 1);
+}
+
+}  // namespace
+
+ncfUInt32 LastError() {
+    return ::GetLastError();
+}
+
+FileHandle OpenForReading(const std::u16string& path) {
+    const HANDLE file = ::CreateFileW(Wide(path), GENERIC_READ, FILE_SHARE_READ, nullptr,
+                                      OPEN_EXISTING, FILE_FLAG_NO_BUFFERING, nullptr);
+    return file == INVALID_HANDLE_VALUE ? kNoFile : reinterpret_cast<FileHandle>(file);
+}
+
+bool Close(FileHandle file) {
+    return ::CloseHandle(AsHandle(file)) != 0;
+}
+
+bool GetFileSize(FileHandle file, ncfUInt64* size) {
+    BY_HANDLE_FILE_INFORMATION information{};
+    if (!::GetFileInformationByHandle(AsHandle(file), &information)) {
+        return false;
+    }
+    *size = static_cast<ncfUInt64>(information.nFileSizeHigh) << 32 | information.nFileSizeLow;
+    return true;
+}
+
+bool GetSectorSize(FileHandle, const std::u16string& path, ncfUInt32* bytes) {
+    const std::u16string root = VolumeRoot(path);
+    DWORD size = 0;
+    if (root.empty() || !::GetDiskFreeSpaceW(Wide(root), nullptr, &size, nullptr, nullptr) ||
+        size == 0) {
+        return false;
+    }
+    *bytes = size;
+    return true;
+}
+
+bool SetPosition(FileHandle file, ncfUInt64 position) {
+    LARGE_INTEGER target{};
+    target.QuadPart = static_cast<LONGLONG>(position);
+    return ::SetFilePointerEx(AsHandle(file), target, nullptr, FILE_BEGIN) != 0;
+}
+
+bool Read(FileHandle file, void* buffer, ncfUInt32 size, ncfUInt32* bytesRead) {
+    DWORD done = 0;
+    if (!::ReadFile(AsHandle(file), buffer, size, &done, nullptr)) {
+        return false;
+    }
+    *bytesRead = done;
+    return true;
+}
+
+void* AllocateAligned(std::size_t size, std::size_t alignment) {
+    return _aligned_malloc(size, alignment);
+}
+
+void FreeAligned(void* memory) {
+    _aligned_free(memory);
+}
+
+bool GetLastWriteTime(const std::u16string& path, DateTime* date) {
+    WIN32_FILE_ATTRIBUTE_DATA attributes{};
+    SYSTEMTIME utc{};
+    if (!::GetFileAttributesExW(Wide(path), GetFileExInfoStandard, &attributes) ||
+        !::FileTimeToSystemTime(&attributes.ftLastWriteTime, &utc)) {
+        return false;
+    }
+    *date = {utc.wYear, utc.wMonth, utc.wDay, utc.wDayOfWeek, utc.wHour, utc.wMinute, utc.wSecond};
+    return true;
+}
+
+bool GetModulePath(const void* address, std::wstring* path) {
+    HMODULE module = nullptr;
+    // The reference that this look-up adds is never given back: once started,
+    // the module stays mapped.
+    if (!::GetModuleHandleExA(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS,
+                              static_cast<LPCSTR>(address), &module)) {
+        return false;
+    }
+    wchar_t buffer[260] = {};
+    const DWORD length = ::GetModuleFileNameW(module, buffer, 260);
+    buffer[259] = L'\0';
+    if (length == 0) {
+        return false;
+    }
+    *path = buffer;
+    return true;
+}
+
+void* LoadLibraryByName(const char* name) {
+    return reinterpret_cast<void*>(::LoadLibraryA(name));
+}
+
+void* FindSymbol(void* library, const char* name) {
+    return reinterpret_cast<void*>(::GetProcAddress(static_cast<HMODULE>(library), name));
+}
+
+void* CreateNamedMutex(const char* name) {
+    return ::CreateMutexA(nullptr, FALSE, name);
+}
+
+Wait WaitForMutex(void* mutex) {
+    switch (::WaitForSingleObject(mutex, INFINITE)) {
+        case WAIT_OBJECT_0:
+            return Wait::kAcquired;
+        case WAIT_ABANDONED:
+            return Wait::kAbandoned;
+        case WAIT_TIMEOUT:
+            return Wait::kTimeout;
+        default:
+            return Wait::kFailed;
+    }
+}
+
+bool ReleaseMutex(void* mutex) {
+    return ::ReleaseMutex(mutex) != 0;
+}
+
+void CloseMutex(void* mutex) {
+    if (mutex) {
+        ::CloseHandle(mutex);
+    }
+}
+
+ncfUInt64 CurrentThreadId() {
+    return ::GetCurrentThreadId();
+}
+
+const void* OwnModule() {
+    HMODULE module = nullptr;
+    ::GetModuleHandleExA(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS |
+                             GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
+                         reinterpret_cast<LPCSTR>(&OwnModule), &module);
+    return module;
+}
+
+std::string ErrorText(ncfUInt32 error) {
+    char buffer[512] = {};
+    DWORD length = ::FormatMessageA(FORMAT_MESSAGE_FROM_SYSTEM | FORMAT_MESSAGE_IGNORE_INSERTS,
+                                    nullptr, error, MAKELANGID(LANG_NEUTRAL, SUBLANG_DEFAULT),
+                                    buffer, sizeof buffer - 1, nullptr);
+    while (length > 0 && (buffer[length - 1] == '\n' || buffer[length - 1] == '\r')) {
+        buffer[--length] = '\0';
+    }
+    return buffer;
+}
+
+}  // namespace os
