@@ -1,0 +1,45 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <vector>
+
+#include "host_interfaces/framework/ResultCodes.h"
+#include "source/descriptor_data/XMLDataPropertyDescription.h"
+
+// A search that ended without a find: an answer, no failure.
+inline constexpr NCFRESULT kPropertyNotFound = 1;
+
+// One node of a tree: of the declared tree, or of an entry that was read. It
+// owns nothing; the container owns descriptions and nodes alike.
+class XMLDataPropertyValue {
+public:
+    // Throws NCF_E_HANDLE without a description.
+    explicit XMLDataPropertyValue(const XMLDataPropertyDescription* description);
+
+    NCFRESULT GetDesc(const XMLDataPropertyDescription** outDesc) const;
+    NCFRESULT SetValue(const NMAString& value);
+    NCFRESULT GetValue(NMAString* outValue) const;
+    NCFRESULT SetParent(XMLDataPropertyValue* parent);
+    NCFRESULT GetParent(XMLDataPropertyValue** outPropertyValue) const;  // null at a root
+    // Links the child to this node first and keeps it only if that succeeded.
+    NCFRESULT AddChild(XMLDataPropertyValue* child);
+
+    // Searches outward: this node, its children, then the same from its parent
+    // on. 0 found, kPropertyNotFound otherwise.
+    NCFRESULT FindNextProperty(const char* property, XMLDataPropertyValue** dataPropertyValue);
+    // Searches the direct children; the first form appends every match, the
+    // second gives the first, null when there is none.
+    NCFRESULT FindPropertyInChildren(
+        const char* property, std::vector<XMLDataPropertyValue*>* dataPropertyValueVect) const;
+    NCFRESULT FindPropertyInChildren(const char* property,
+                                     XMLDataPropertyValue** dataPropertyValue) const;
+
+    const std::vector<XMLDataPropertyValue*>& Children() const { return children_; }
+
+private:
+    const XMLDataPropertyDescription* description_;
+    NMAString value_;
+    XMLDataPropertyValue* parent_ = nullptr;
+    std::vector<XMLDataPropertyValue*> children_;
+};
