@@ -30,8 +30,9 @@ bool Close(FileHandle file);
 // Length in bytes.
 bool GetFileSize(FileHandle file, ncfUInt64* size);
 // Bytes in a sector of the volume, which reads are aligned to in position, size
-// and address. false when unknown.
-bool GetSectorSize(FileHandle file, const std::u16string& path, ncfUInt32* bytes);
+// and address. `volumeRoot` is what SimpleFileIO took from the path, empty when
+// there is none; only Windows asks by it. false when unknown.
+bool GetSectorSize(FileHandle file, const std::u16string& volumeRoot, ncfUInt32* bytes);
 bool SetPosition(FileHandle file, ncfUInt64 position);
 // Reads at the position set; `*bytesRead` below `size` at the end of the file.
 bool Read(FileHandle file, void* buffer, ncfUInt32 size, ncfUInt32* bytesRead);

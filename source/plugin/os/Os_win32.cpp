@@ -20,21 +20,6 @@ const wchar_t* Wide(const std::u16string& text) {
     return reinterpret_cast<const wchar_t*>(text.c_str());
 }
 
-// The root that the query for the sector size wants: a drive's first three
-// characters, or a share's up to its fourth backslash.
-std::u16string VolumeRoot(const std::u16string& path) {
-    if (path.size() >= 3 && path[1] == u':' && path[2] == u'\\') {
-        return path.substr(0, 3);
-    }
-    if (path.compare(0, 2, u"\\\\") != 0) {
-        return {};
-    }
-    const std::size_t third = path.find(u'\\', 3);
-    const std::size_t fourth =
-        third == std::u16string::npos ? third : path.find(u'\\', third + 1);
-    return fourth == std::u16string::npos ? std::u16string() : path.substr(0, fourth + 1);
-}
-
 }  // namespace
 
 ncfUInt32 LastError() {
@@ -60,10 +45,9 @@ bool GetFileSize(FileHandle file, ncfUInt64* size) {
     return true;
 }
 
-bool GetSectorSize(FileHandle, const std::u16string& path, ncfUInt32* bytes) {
-    const std::u16string root = VolumeRoot(path);
+bool GetSectorSize(FileHandle, const std::u16string& volumeRoot, ncfUInt32* bytes) {
     DWORD size = 0;
-    if (root.empty() || !::GetDiskFreeSpaceW(Wide(root), nullptr, &size, nullptr, nullptr) ||
+    if (volumeRoot.empty() || !::GetDiskFreeSpaceW(Wide(volumeRoot), nullptr, &size, nullptr, nullptr) ||
         size == 0) {
         return false;
     }

@@ -1,0 +1,33 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "host_interfaces/framework/Lock.h"
+#include "tests/support/fakes/FakeObject.h"
+#include "tests/support/fakes/Journal.h"
+
+// Lock that writes "lock" and "unlock" into the journal.
+class FakeLock : public FakeObject<INCFLock> {
+public:
+    explicit FakeLock(Journal* journal = nullptr) : journal_(journal) {}
+
+    NCFRESULT Lock() override {
+        ++depth_;
+        if (journal_) {
+            journal_->add("lock");
+        }
+        return NCF_OK;
+    }
+    NCFRESULT Unlock() override {
+        --depth_;
+        if (journal_) {
+            journal_->add("unlock");
+        }
+        return NCF_OK;
+    }
+    int depth() const { return depth_; }
+
+private:
+    Journal* journal_;
+    int depth_ = 0;
+};
