@@ -71,7 +71,7 @@ struct StoredProperty {
     std::uint16_t keyPid = 0;
 
     // Weak forms: the pids from the root object down to the strong set that
-    // holds the targets. Empty after reading when the file names no such path.
+    // holds the targets.
     std::vector<std::uint16_t> targetPath;
 };
 
