@@ -5,7 +5,8 @@
 #include "host_interfaces/framework/Unknown.h"
 
 #if defined(__MINGW32__)
-#define NCF_PRINTF(text, first) __attribute__((format(__MINGW_PRINTF_FORMAT, text, first)))
+// Every part of the system is built with the ANSI formatter.
+#define NCF_PRINTF(text, first) __attribute__((format(gnu_printf, text, first)))
 #elif defined(__GNUC__)
 #define NCF_PRINTF(text, first) __attribute__((format(printf, text, first)))
 #else

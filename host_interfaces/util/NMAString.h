@@ -44,6 +44,7 @@ public:
     const wchar_t* GetWCHARString() const;
 
 private:
+    friend class NMAStringUtils;  // builds texts from their characters
     struct State;
     State* state_;
 };

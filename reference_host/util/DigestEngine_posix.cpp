@@ -1,0 +1,38 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <openssl/evp.h>
+
+#include "reference_host/util/DigestEngine.h"
+
+namespace host::util {
+
+struct DigestEngine::Handle {
+    EVP_MD_CTX* context = nullptr;
+};
+
+DigestEngine::DigestEngine() : handle_(std::make_unique<Handle>()) {
+    EVP_MD_CTX* context = EVP_MD_CTX_new();
+    if (context != nullptr && EVP_DigestInit_ex(context, EVP_sha256(), nullptr) != 1) {
+        EVP_MD_CTX_free(context);
+        context = nullptr;
+    }
+    handle_->context = context;
+}
+
+DigestEngine::~DigestEngine() {
+    EVP_MD_CTX_free(handle_->context);
+}
+
+bool DigestEngine::IsReady() const {
+    return handle_->context != nullptr;
+}
+
+bool DigestEngine::Add(const unsigned char* data, std::size_t size) {
+    return EVP_DigestUpdate(handle_->context, data, size) == 1;
+}
+
+bool DigestEngine::Finish(std::array<unsigned char, kDigestBytes>& digest) {
+    return EVP_DigestFinal_ex(handle_->context, digest.data(), nullptr) == 1;
+}
+
+}  // namespace host::util

@@ -1,0 +1,191 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "host_interfaces/util/NMAString.h"
+
+#include <new>
+
+#include "reference_host/util/Factory.h"
+#include "reference_host/util/NMAStringState.h"
+#include "reference_host/util/RefusingString.h"
+#include "reference_host/util/text/Encodings.h"
+
+namespace text = host::text;
+using host::util::Quietly;
+
+NMAString::NMAString() : state_(new (std::nothrow) State) {}
+
+NMAString::NMAString(const NMAString& other) : NMAString() {
+    *this = other;
+}
+
+NMAString::NMAString(const char* utf8) : NMAString() {
+    if (state_ == nullptr) {
+        return;
+    }
+    state_->encoding = kNCFUTF8;
+    Quietly(false, [&] {
+        state_->text = text::FromUtf8(utf8 == nullptr ? "" : utf8);
+        return true;
+    });
+}
+
+NMAString::NMAString(INCFString* source, ncfUInt32 encoding) : NMAString() {
+    if (state_ == nullptr) {
+        return;
+    }
+    state_->encoding = encoding <= kNCFWCHAR ? encoding : kNCFUTF16;
+    Quietly(false, [&] {
+        state_->text = text::Read(source);
+        return true;
+    });
+}
+
+NMAString::~NMAString() {
+    delete state_;
+}
+
+NMAString& NMAString::operator=(const NMAString& other) {
+    if (this == &other || state_ == nullptr) {
+        return *this;
+    }
+    std::u32string copy;
+    ncfUInt32 encoding = kNCFUTF16;
+    if (other.state_ != nullptr) {
+        const std::lock_guard<std::mutex> guard(other.state_->mutex);
+        Quietly(false, [&] {
+            other.state_->LookAtShown();
+            copy = other.state_->text;
+            return true;
+        });
+        encoding = other.state_->encoding;
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    state_->Hide();
+    state_->Take(std::move(copy));
+    state_->encoding = encoding;
+    return *this;
+}
+
+bool NMAString::operator==(const NMAString& other) const {
+    if (this == &other) {
+        return true;
+    }
+    const auto copyOf = [](const NMAString& string) {
+        if (string.state_ == nullptr) {
+            return std::u32string();
+        }
+        const std::lock_guard<std::mutex> guard(string.state_->mutex);
+        string.state_->LookAtShown();
+        return string.state_->text;
+    };
+    return Quietly(false, [&] { return copyOf(*this) == copyOf(other); });
+}
+
+NMAString& NMAString::operator+=(const NMAString& tail) {
+    const NMAString copy(tail);  // the two may be one object
+    if (state_ == nullptr || copy.state_ == nullptr) {
+        return *this;
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    Quietly(false, [&] {
+        state_->LookAtShown();
+        std::u32string joined = state_->text + copy.state_->text;
+        state_->Hide();
+        state_->Take(std::move(joined));
+        return true;
+    });
+    return *this;
+}
+
+bool NMAString::IsEmpty() const {
+    if (state_ == nullptr) {
+        return true;
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    return Quietly(true, [&] {
+        state_->LookAtShown();
+        return state_->text.empty();
+    });
+}
+
+NCFRESULT NMAString::CreateString(INCFString** out) {
+    return host::util::CreateHostString(out);
+}
+
+INCFString* NMAString::InArg() const {
+    if (state_ == nullptr) {
+        return host::util::RefusingString();
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    if (state_->shown != nullptr) {
+        return state_->shown;
+    }
+    INCFString* made = nullptr;
+    if (CreateString(&made) < 0) {
+        return host::util::RefusingString();
+    }
+    const NCFRESULT filled = Quietly(NCF_E_OUTOFMEMORY, [&] {
+        const NCFRESULT result = text::Assign(made, state_->text, state_->encoding);
+        // Text that has no form in the wanted encoding is shown all the same.
+        return result >= 0 ? result : text::Assign(made, state_->text, kNCFUTF16);
+    });
+    if (filled < 0) {
+        made->Release();
+        return host::util::RefusingString();
+    }
+    state_->shown = made;
+    return made;
+}
+
+INCFString** NMAString::OutArg() {
+    if (state_ == nullptr) {
+        static INCFString* nowhere = nullptr;
+        return &nowhere;
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    state_->Hide();
+    state_->Take({});
+    return &state_->shown;
+}
+
+const char* NMAString::GetUTF8String() const {
+    if (state_ == nullptr) {
+        return "";
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    return Quietly("", [&] {
+        state_->LookAtShown();
+        if (!state_->utf8) {
+            state_->utf8 = text::ToUtf8Lossy(state_->text);
+        }
+        return state_->utf8->c_str();
+    });
+}
+
+const ncfUTF16* NMAString::GetUTF16String() const {
+    if (state_ == nullptr) {
+        return u"";
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    return Quietly(u"", [&] {
+        state_->LookAtShown();
+        if (!state_->utf16) {
+            state_->utf16 = text::ToUtf16Lossy(state_->text);
+        }
+        return state_->utf16->c_str();
+    });
+}
+
+const wchar_t* NMAString::GetWCHARString() const {
+    if (state_ == nullptr) {
+        return L"";
+    }
+    const std::lock_guard<std::mutex> guard(state_->mutex);
+    return Quietly(L"", [&] {
+        state_->LookAtShown();
+        if (!state_->wide) {
+            state_->wide = text::ToWideLossy(state_->text);
+        }
+        return state_->wide->c_str();
+    });
+}

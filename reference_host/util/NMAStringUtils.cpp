@@ -1,0 +1,60 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "host_interfaces/util/NMAStringUtils.h"
+
+#include <cstring>
+#include <cwchar>
+
+#include "reference_host/util/NMAStringState.h"
+#include "reference_host/util/text/Encodings.h"
+#include "reference_host/util/text/Paths.h"
+
+namespace text = host::text;
+using host::util::Quietly;
+
+NMAString NMAStringUtils::CreateWCharNMAString(const wchar_t* characters, ncfSInt32 length) {
+    NMAString made;
+    if (characters == nullptr || length < -1 || made.state_ == nullptr) {
+        return made;
+    }
+    made.state_->encoding = kNCFWCHAR;
+    Quietly(false, [&] {
+        const std::size_t units =
+            length == -1 ? std::wcslen(characters) : static_cast<std::size_t>(length);
+        made.state_->text = text::FromWide({characters, units});
+        return true;
+    });
+    return made;
+}
+
+NMAString NMAStringUtils::GetParentFolder(const NMAString& path) {
+    NMAString folder(path);
+    if (folder.state_ == nullptr) {
+        return folder;
+    }
+    std::u32string& characters = folder.state_->text;
+    while (!characters.empty() && !text::IsSeparator(characters.back())) {
+        characters.pop_back();
+    }
+    return folder;
+}
+
+NMAString NMAStringUtils::CombinePath(const NMAString& folder, const NMAString& name) {
+    NMAString path(folder);
+    if (path.state_ == nullptr) {
+        return path;
+    }
+    std::u32string& characters = path.state_->text;
+    if (!characters.empty() && !text::IsSeparator(characters.back())) {
+        Quietly(false, [&] {
+            characters.push_back(U'\\');
+            return true;
+        });
+    }
+    path += name;
+    return path;
+}
+
+bool NMAStringUtils::IsStartWith(const NMAString& whole, const char* start) {
+    return start != nullptr && std::strncmp(whole.GetUTF8String(), start, std::strlen(start)) == 0;
+}

@@ -1,0 +1,70 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/util/files/FileSystem.h"
+
+#include <windows.h>
+
+#include <cwctype>
+#include <iterator>
+
+#include "reference_host/util/text/Encodings.h"
+
+namespace host::files {
+
+namespace {
+
+// A file time counts tenths of a microsecond from 1601.
+constexpr std::uint64_t kTicksPerSecond = 10'000'000;
+constexpr std::uint64_t kSecondsFrom1601To1970 = 11'644'473'600;
+
+std::uint32_t VolumeType(const wchar_t* root) {
+    switch (GetDriveTypeW(root)) {
+        case DRIVE_REMOVABLE:
+        case DRIVE_CDROM:
+            return 2;
+        case DRIVE_FIXED:
+        case DRIVE_RAMDISK:
+            return 3;
+        case DRIVE_REMOTE:
+            return 4;
+        default:
+            return 0;
+    }
+}
+
+}  // namespace
+
+VolumeFacts ReadVolumeFacts(const std::filesystem::path& folder) {
+    VolumeFacts volume;
+    wchar_t root[MAX_PATH + 1] = {};
+    if (!GetVolumePathNameW(folder.c_str(), root, static_cast<DWORD>(std::size(root)))) {
+        return volume;
+    }
+    wchar_t label[MAX_PATH + 1] = {};
+    DWORD serial = 0;
+    if (GetVolumeInformationW(root, label, static_cast<DWORD>(std::size(label)), &serial, nullptr,
+                              nullptr, nullptr, 0)) {
+        volume.serialNumber = serial;
+        volume.label = text::FromWide(label);
+    }
+    volume.type = VolumeType(root);
+    return volume;
+}
+
+std::uint64_t LastWrite(const std::filesystem::path& file) {
+    WIN32_FILE_ATTRIBUTE_DATA facts{};
+    if (!GetFileAttributesExW(file.c_str(), GetFileExInfoStandard, &facts)) {
+        return 0;
+    }
+    const std::uint64_t ticks = static_cast<std::uint64_t>(facts.ftLastWriteTime.dwHighDateTime)
+                                    << 32 |
+                                facts.ftLastWriteTime.dwLowDateTime;
+    const std::uint64_t seconds = ticks / kTicksPerSecond;
+    return seconds < kSecondsFrom1601To1970 ? 0 : seconds - kSecondsFrom1601To1970;
+}
+
+char32_t NameCharacter(char32_t c) {
+    return c <= 0xFFFF ? static_cast<char32_t>(std::towlower(static_cast<wint_t>(c))) : c;
+}
+
+}  // namespace host::files
