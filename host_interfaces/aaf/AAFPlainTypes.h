@@ -30,10 +30,12 @@ using HRESULT = aafInt32;
 using AAFRESULT = aafInt32;
 using ULONG = aafUInt32;
 
+#ifndef _WIN32  // the system's header for GUID has these
 using IID = GUID;
 using CLSID = GUID;
 using REFIID = const GUID&;
 using REFCLSID = const GUID&;
+#endif
 
 using aafUID_t = GUID;
 using aafMemPtr_t = aafUInt8*;

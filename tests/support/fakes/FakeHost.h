@@ -10,6 +10,7 @@
 
 #include "host_interfaces/framework/ComponentFactory.h"
 #include "host_interfaces/framework/Console.h"
+#include "host_interfaces/framework/String.h"
 #include "tests/support/fakes/FakeObject.h"
 #include "tests/support/fakes/Journal.h"
 

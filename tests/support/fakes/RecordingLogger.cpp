@@ -48,7 +48,7 @@ private:
 }  // namespace
 
 RecordingLog::RecordingLog(FakeHost& host, Journal* journal) {
-    records.clear();
+    ::records.clear();
     recordJournal = journal;
     host.maker(CompID_LockComponent, [](const GUID&, void** out) {
         *out = static_cast<INCFLock*>(new FakeLock);
@@ -63,7 +63,7 @@ RecordingLog::~RecordingLog() {
     PluginLogSink::Instance().Stop();
     PluginLogSink::Instance().SetLoggerMaker(nullptr);
     recordJournal = nullptr;
-    records.clear();
+    ::records.clear();
 }
 
 const std::vector<LoggedRecord>& RecordingLog::records() const {
