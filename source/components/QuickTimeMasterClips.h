@@ -1,0 +1,40 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <vector>
+
+#include "host_interfaces/framework/Console.h"
+#include "host_interfaces/media/AAFClips.h"
+#include "host_interfaces/util/NMAString.h"
+#include "source/plugin/CNCFUnknown.h"
+#include "source/plugin/NCFSmartPtr.h"
+
+namespace NMA::Impl {
+
+// The movies of a folder. The list is cheap: each description is built afresh
+// and goes to the caller, and no clip is kept.
+class QuickTimeMasterClips final : public CNCFComponent<IAAFClips> {
+public:
+    explicit QuickTimeMasterClips(INCFUnknown* outer) : CNCFComponent(outer) {}
+
+    NCFRESULT InitializeInstance(INCFUnknown* host) override;
+    NCFRESULT InternalQueryInterface(const GUID& iid, void** out) override;
+
+    ncfSInt32 GetCount() override;
+    NCFRESULT GetMetadata(ncfSInt32 index, IAAFFile** ppData) override;
+    NCFRESULT GetClipPath(ncfSInt32 index, INCFString* path) override;
+
+    void SetFolder(const NMAString& folder) { _folder = folder; }
+    // Lists the folder's movies in the order of the file system; hidden ones
+    // are skipped.
+    void Scan();
+
+private:
+    NMAString _folder;
+    std::vector<NMAString> _MCList;  // full paths
+    NCFSmartPtr<INCFComponentFactory> _pComponentFactory;
+    NCFSmartPtr<INCFConsole> _pConsole;
+};
+
+}  // namespace NMA::Impl

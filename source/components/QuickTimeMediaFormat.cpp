@@ -1,0 +1,43 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "source/components/QuickTimeMediaFormat.h"
+
+#include "host_interfaces/media/PluginComponents.h"
+#include "source/components/HostServices.h"
+#include "source/components/InterfaceEntry.h"
+#include "source/components/QuickTimeMasterClips.h"
+#include "source/plugin/CreationFunctions.h"
+
+namespace NMA::Impl {
+
+NCFRESULT CreateQuickTimeMediaFormat(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
+                                     void** out) {
+    return CreateInstanceOf<QuickTimeMediaFormat>(host, outer, iid, out);
+}
+
+NCFRESULT QuickTimeMediaFormat::InitializeInstance(INCFUnknown* host) {
+    return InterfaceEntry([&] {
+        TakeComponentFactory(host, componentFactory_);
+        return NCF_OK;
+    });
+}
+
+NCFRESULT QuickTimeMediaFormat::InternalQueryInterface(const GUID& iid, void** out) {
+    return QueryListedInterfaces<IMediaFormat>(this, iid, out);
+}
+
+NCFRESULT QuickTimeMediaFormat::GetAAFClips(IAAFClips** clips) {
+    return InterfaceEntry([&] {
+        if (!clips) {
+            return NCF_E_POINTER;
+        }
+        QuickTimeMasterClips& list = CreateOwnComponent<QuickTimeMasterClips>(
+            componentFactory_.inArg(), CompID_QuickTimeMasterClips, IID_IAAFClips, clips);
+        list.SetFolder(volumePath_);
+        list.Scan();
+        return NCF_OK;
+    });
+}
+
+}  // namespace NMA::Impl
