@@ -41,6 +41,11 @@ class TemporaryFile {
 public:
     explicit TemporaryFile(const std::filesystem::path& target) : path_(target) {
         path_ += ".part";
+        std::error_code ignored;
+        for (int i = 2; std::filesystem::exists(path_, ignored); ++i) {
+            path_ = target;
+            path_ += ".part" + std::to_string(i);
+        }
     }
     TemporaryFile(const TemporaryFile&) = delete;
     TemporaryFile& operator=(const TemporaryFile&) = delete;
@@ -107,7 +112,7 @@ FileResult readFile(const std::filesystem::path& path, Bytes& bytes) {
     return {};
 }
 
-bool carriesSignature(const std::uint8_t* header, std::size_t size, StoredAuid* kind) {
+bool carriesSignature(const std::uint8_t* header, std::size_t size, SectorSize* kind) {
     if (size < signatureOffset + sizeof(StoredAuid) ||
         std::memcmp(header, compoundMagic, sizeof(compoundMagic)) != 0) {
         return false;
@@ -118,7 +123,7 @@ bool carriesSignature(const std::uint8_t* header, std::size_t size, StoredAuid* 
         return false;
     }
     if (kind != nullptr) {
-        *kind = signature;
+        *kind = signature == signature512 ? SectorSize::Bytes512 : SectorSize::Bytes4096;
     }
     return true;
 }
@@ -154,7 +159,7 @@ FileResult loadTree(const std::filesystem::path& path, StoredObject& root) {
     }
 }
 
-bool isAafFile(const std::filesystem::path& path, StoredAuid* kind) {
+bool isAafFile(const std::filesystem::path& path, SectorSize* kind) {
     std::uint8_t header[signatureOffset + sizeof(StoredAuid)] = {};
     std::ifstream in(path, std::ios::binary);
     in.read(reinterpret_cast<char*>(header), sizeof(header));

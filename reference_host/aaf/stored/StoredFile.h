@@ -39,8 +39,8 @@ FileResult saveTree(const StoredObject& root, const std::filesystem::path& path,
 FileResult loadTree(const std::filesystem::path& path, StoredObject& root);
 
 // Looks at the first bytes only. False also when the file cannot be read. The
-// kind is the signature that the file carries; null when it is not wanted.
-bool isAafFile(const std::filesystem::path& path, StoredAuid* kind);
+// kind is what the file's signature says; null when it is not wanted.
+bool isAafFile(const std::filesystem::path& path, SectorSize* kind);
 
 // Class of the object that holds everything, the root of every file.
 extern const StoredAuid rootClassId;

@@ -69,7 +69,8 @@ private:
     std::map<std::vector<std::uint16_t>, std::uint16_t> tags_;
 };
 
-// What an object's storage holds besides its property table.
+// What an object's storage holds besides its property table. Names cannot
+// clash, since each carries the pid of its property.
 struct Layout {
     struct Child {
         std::u16string name;
@@ -97,23 +98,6 @@ struct Layout {
             .number(static_cast<std::uint16_t>(value.size()));
         values.append(value);
         ++count;
-    }
-
-    void checkNames() const {
-        std::set<std::u16string> names = {propertiesStream, referencedPropertiesStream};
-        for (const Stream& stream : streams) {
-            check(names, stream.name);
-        }
-        for (const Child& child : children) {
-            check(names, child.name);
-        }
-    }
-
-private:
-    static void check(std::set<std::u16string>& names, const std::u16string& name) {
-        if (!names.insert(name).second) {
-            throw StoredError("two properties want the name \"" + toUtf8(name) + "\"");
-        }
     }
 };
 
@@ -160,7 +144,6 @@ private:
                 throw StoredError(propertyText(property.pid) + ": " + problem.what());
             }
         }
-        layout.checkNames();
         writeLayout(storage, object, layout, depth);
     }
 

@@ -1,0 +1,220 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/aaf/stored/CompoundFileWriter.h"
+#include "reference_host/aaf/stored/LittleEndian.h"
+#include "reference_host/aaf/stored/StoredError.h"
+#include "reference_host/aaf/stored/StoredFile.h"
+#include "reference_host/aaf/stored/TreeReader.h"
+#include "reference_host/aaf/stored/TreeWriter.h"
+#include "tests/unit/aaf_library/stored/SampleTree.h"
+
+#include <gtest/gtest.h>
+#include <functional>
+#include <random>
+
+using namespace aaf::stored;
+
+namespace {
+
+std::string refusal(const Bytes& file) {
+    try {
+        readTree(file);
+        return "";
+    } catch (const StoredError& problem) {
+        return problem.what();
+    }
+}
+
+// A file whose root storage holds what the function puts there.
+Bytes fileWith(const std::function<void(StorageWriter&)>& fill) {
+    CompoundFileWriter writer(SectorSize::Bytes512);
+    writer.root().setClass(rootClassId);
+    fill(writer.root());
+    return writer.finish();
+}
+
+// A properties stream with one property.
+Bytes oneProperty(std::uint16_t pid, std::uint16_t form, const Bytes& value) {
+    return ByteWriter()
+        .number(std::uint8_t{0x4C})
+        .number(std::uint8_t{0x20})
+        .number(std::uint16_t{1})
+        .number(pid)
+        .number(form)
+        .number(static_cast<std::uint16_t>(value.size()))
+        .append(value)
+        .bytes();
+}
+
+Bytes name(const std::u16string& text) {
+    return ByteWriter().text(text).bytes();
+}
+
+Bytes fileWithProperties(const Bytes& properties) {
+    return fileWith([&](StorageWriter& root) { root.stream(u"properties", properties); });
+}
+
+Bytes fileWithIndex(std::uint16_t form, const Bytes& index) {
+    return fileWith([&](StorageWriter& root) {
+        root.stream(u"properties", oneProperty(0x1901, form, name(u"Mobs-1901")));
+        root.stream(u"Mobs-1901 index", index);
+    });
+}
+
+}  // namespace
+
+TEST(DamagedFile, IsRefusedHoweverItIsCutShort) {
+    for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
+        const Bytes file = writeTree(sample::everyForm(), size);
+        for (std::size_t length = 0; length < file.size(); length += 64) {
+            const Bytes cut(file.begin(), file.begin() + static_cast<std::ptrdiff_t>(length));
+            // A last sector that nothing uses may be missing; all else is felt.
+            const std::string why = refusal(cut);
+            if (why.empty()) {
+                EXPECT_EQ(readTree(cut), readTree(file)) << length;
+                EXPECT_GE(length, file.size() - static_cast<std::size_t>(size)) << length;
+            }
+        }
+    }
+}
+
+TEST(DamagedFile, WithAFlippedByteIsReadOrRefusedButNeverHarms) {
+    const Bytes file = writeTree(sample::everyForm(), SectorSize::Bytes512);
+    std::size_t refused = 0;
+    for (std::size_t at = 0; at < file.size(); ++at) {
+        Bytes damaged = file;
+        damaged[at] ^= at % 2 == 0 ? 0x01 : 0xFF;
+        refused += refusal(damaged).empty() ? 0 : 1;
+    }
+    // Content and padding may change without notice, structure may not.
+    EXPECT_GT(refused, file.size() / 20);
+}
+
+TEST(DamagedFile, WithSeveralRandomBytesIsReadOrRefusedButNeverHarms) {
+    const unsigned seed = std::random_device()();
+    SCOPED_TRACE("seed " + std::to_string(seed));
+    std::mt19937 random(seed);
+    const Bytes file = writeTree(sample::everyForm(), SectorSize::Bytes512);
+    std::size_t refused = 0;
+    for (int round = 0; round < 2000; ++round) {
+        Bytes damaged = file;
+        for (int i = 0; i < 20; ++i) {
+            damaged[random() % damaged.size()] = static_cast<std::uint8_t>(random());
+        }
+        refused += refusal(damaged).empty() ? 0 : 1;
+    }
+    EXPECT_GT(refused, 100u);
+}
+
+TEST(DamagedFile, WithoutPropertiesIsRefused) {
+    EXPECT_EQ(refusal(fileWith([](StorageWriter&) {})), "\"properties\" is missing");
+}
+
+TEST(DamagedFile, WithAPropertyTableThatEndsEarlyIsRefused) {
+    EXPECT_EQ(refusal(fileWithProperties({0x4C})), "1 bytes wanted, 0 left");
+    EXPECT_EQ(refusal(fileWithProperties({0x4C, 0x20, 0xFF, 0xFF})), "393210 bytes wanted, 0 left");
+    Bytes properties = oneProperty(0x4402, 0x82, {1, 2, 3});
+    properties.pop_back();
+    EXPECT_EQ(refusal(fileWithProperties(properties)), "property 4402: 3 bytes wanted, 2 left");
+}
+
+TEST(DamagedFile, OfTheOtherByteOrderIsRefused) {
+    EXPECT_EQ(refusal(fileWithProperties({0x42, 0x20, 0, 0})),
+              "big-endian files are not supported");
+    EXPECT_EQ(refusal(fileWithProperties({0x41, 0x20, 0, 0})), "unknown byte order");
+}
+
+TEST(DamagedFile, WithAPropertyTwiceIsRefused) {
+    const Bytes twice = {0x4C, 0x20, 2, 0, 2, 0x44, 0x82, 0, 1, 0, 2, 0x44, 0x82, 0, 1, 0, 7, 7};
+    EXPECT_EQ(refusal(fileWithProperties(twice)), "property 4402: occurs twice");
+}
+
+TEST(DamagedFile, WithAPropertyOfNoBytesIsReadWithoutIt) {
+    const StoredObject tree = readTree(fileWithProperties(oneProperty(0x4402, 0x82, {})));
+    EXPECT_TRUE(tree.properties.empty());
+}
+
+TEST(DamagedFile, WithAnObjectMissingIsRefused) {
+    EXPECT_EQ(refusal(fileWithProperties(oneProperty(2, 0x22, name(u"Header-2")))),
+              "property 0002: \"Header-2\" is missing");
+}
+
+TEST(DamagedFile, WithANameThatDoesNotEndIsRefused) {
+    EXPECT_EQ(refusal(fileWithProperties(oneProperty(2, 0x22, {'H', 0}))),
+              "property 0002: a name that does not end with its terminator");
+    EXPECT_EQ(refusal(fileWithProperties(oneProperty(2, 0x22, {'H', 0, 0}))),
+              "property 0002: a name of 3 bytes");
+}
+
+TEST(DamagedFile, WithOneObjectInTwoPlacesIsRefused) {
+    Bytes index = ByteWriter()
+                      .number(std::uint32_t{2})
+                      .number(std::uint64_t{0})
+                      .number(std::uint32_t{0})
+                      .number(std::uint32_t{0})
+                      .bytes();
+    const Bytes file = fileWith([&](StorageWriter& root) {
+        root.stream(u"properties", oneProperty(0x4403, 0x32, name(u"Slots-4403")));
+        root.stream(u"Slots-4403 index", index);
+        StorageWriter slot = root.storage(u"Slots-4403{0}");
+        slot.stream(u"properties", {0x4C, 0x20, 0, 0});
+        slot.close();
+    });
+    EXPECT_EQ(refusal(file), "property 4403: \"Slots-4403{0}\" is referred to twice");
+}
+
+TEST(DamagedFile, WithAnIndexThatClaimsTooMuchIsRefused) {
+    Bytes vector(12, 0xFF);
+    EXPECT_EQ(refusal(fileWithIndex(0x32, vector)),
+              "property 1901: the index counts 4294967295 elements, 0 bytes left");
+    Bytes set(12, 0xFF);
+    set.insert(set.end(), {0x01, 0x44, 32, 0, 0});
+    EXPECT_EQ(refusal(fileWithIndex(0x3A, set)),
+              "property 1901: the index counts 4294967295 elements, 2 bytes left");
+    set[14] = 0;
+    EXPECT_EQ(refusal(fileWithIndex(0x3A, set)), "property 1901: a key of 0 bytes");
+}
+
+TEST(DamagedFile, WithAWeakReferenceBeyondTheTableIsRefused) {
+    Bytes reference = {7, 0, 0x01, 0x1B, 16};
+    reference.resize(21);
+    EXPECT_EQ(refusal(fileWithProperties(oneProperty(0x0201, 0x02, reference))),
+              "property 0201: a weak reference has tag 7, the file has 0 paths");
+    EXPECT_EQ(refusal(fileWithProperties(oneProperty(0x0201, 0x02, {7, 0}))),
+              "property 0201: 2 bytes wanted, 0 left");
+}
+
+TEST(DamagedFile, WithATableOfWeakReferencesThatLiesIsRefused) {
+    const auto withTable = [](const Bytes& table) {
+        return fileWith([&](StorageWriter& root) {
+            root.stream(u"properties", {0x4C, 0x20, 0, 0});
+            root.stream(u"referenced properties", table);
+        });
+    };
+    EXPECT_EQ(refusal(withTable({0x4C, 1, 0, 2, 0, 0, 0, 1, 0, 0, 0})), "");
+    EXPECT_EQ(refusal(withTable({0x4C, 1, 0, 0xFF, 0xFF, 0xFF, 0xFF, 1, 0, 0, 0})),
+              "the table of weak references ends early");
+    EXPECT_EQ(refusal(withTable({0x4C, 9, 0, 2, 0, 0, 0, 1, 0, 0, 0})),
+              "the table of weak references has 1 paths and counts 9");
+}
+
+TEST(DamagedFile, NestedWithoutEndIsRefused) {
+    std::function<void(StorageWriter&, int)> nest = [&](StorageWriter& storage, int depth) {
+        storage.stream(u"properties", oneProperty(0x4803, 0x22, name(u"Segment-4803")));
+        if (depth > 0) {
+            StorageWriter inner = storage.storage(u"Segment-4803");
+            nest(inner, depth - 1);
+            inner.close();
+        }
+    };
+    const Bytes file = fileWith([&](StorageWriter& root) { nest(root, maximumDepth + 50); });
+    EXPECT_NE(refusal(file).find("objects are nested too deep"), std::string::npos);
+}
+
+TEST(DamagedFile, StoragesThatNobodyNamesArePassedOver) {
+    const Bytes file = fileWith([&](StorageWriter& root) {
+        root.stream(u"properties", {0x4C, 0x20, 0, 0});
+        root.stream(u"something else", {1, 2, 3});
+    });
+    EXPECT_EQ(refusal(file), "");
+}
