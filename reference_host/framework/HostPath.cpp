@@ -1,0 +1,30 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/framework/HostPath.h"
+
+#include "reference_host/framework/Guard.h"
+#include "reference_host/util/text/Encodings.h"
+#include "reference_host/util/text/HostText.h"
+#include "reference_host/util/text/Paths.h"
+
+namespace host {
+
+NCFRESULT PathFrom(INCFString* text, std::filesystem::path& out) {
+    if (text == nullptr) {
+        return NCF_E_POINTER;
+    }
+    return Guarded([&] {
+        const bool usable = text::ToSystemPath(text::Read(text), out) && !out.empty();
+        return usable ? NCF_OK : NCF_E_INVALIDARG;
+    });
+}
+
+Ref<String> ModulePath(const std::filesystem::path& path) {
+    return MakeString(text::ToModulePath(path));
+}
+
+std::string DisplayPath(const std::filesystem::path& path) {
+    return text::ToUtf8Lossy(text::FromSystemPath(path));
+}
+
+}  // namespace host

@@ -1,0 +1,31 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+namespace host {
+
+// A shared library mapped into the process: one body for each system.
+class SharedLibrary {
+public:
+    SharedLibrary() = default;
+    ~SharedLibrary();
+    SharedLibrary(const SharedLibrary&) = delete;
+    SharedLibrary& operator=(const SharedLibrary&) = delete;
+
+    // False with the system's own words in `reason`.
+    bool Open(const std::filesystem::path& file, std::string& reason);
+    void Close();
+    // Leaves the library mapped to the end of the process.
+    void Abandon() { handle_ = nullptr; }
+
+    // Null when the library exports no such function.
+    void* Find(const char* name) const;
+
+private:
+    void* handle_ = nullptr;
+};
+
+}  // namespace host

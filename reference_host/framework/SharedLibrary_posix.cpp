@@ -1,0 +1,37 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <dlfcn.h>
+
+#include "reference_host/framework/SharedLibrary.h"
+
+namespace host {
+
+SharedLibrary::~SharedLibrary() {
+    Close();
+}
+
+bool SharedLibrary::Open(const std::filesystem::path& file, std::string& reason) {
+    Close();
+    // A bare name would be searched for in the system's folders.
+    std::error_code failure;
+    const std::filesystem::path whole = std::filesystem::absolute(file, failure);
+    handle_ = dlopen(whole.c_str(), RTLD_NOW | RTLD_LOCAL);
+    if (handle_ == nullptr) {
+        const char* text = dlerror();
+        reason = text == nullptr ? "unknown reason" : text;
+    }
+    return handle_ != nullptr;
+}
+
+void SharedLibrary::Close() {
+    if (handle_ != nullptr) {
+        dlclose(handle_);
+        handle_ = nullptr;
+    }
+}
+
+void* SharedLibrary::Find(const char* name) const {
+    return handle_ == nullptr ? nullptr : dlsym(handle_, name);
+}
+
+}  // namespace host

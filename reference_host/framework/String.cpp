@@ -1,0 +1,197 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/framework/String.h"
+
+#include <type_traits>
+
+#include "reference_host/framework/Guard.h"
+#include "reference_host/util/text/Encodings.h"
+#include "reference_host/util/text/HostText.h"
+
+namespace host {
+
+namespace {
+
+// The caller's units, counted where they end with a zero.
+template <class Unit>
+NCFRESULT View(const Unit* text, ncfUInt32 units, std::basic_string_view<Unit>& view) {
+    if (text == nullptr) {
+        view = {};
+        return units == 0 ? NCF_OK : NCF_E_POINTER;
+    }
+    view = units == kNCFZeroTerminated ? std::basic_string_view<Unit>(text)
+                                       : std::basic_string_view<Unit>(text, units);
+    return NCF_OK;
+}
+
+template <class Text, class Variant>
+NCFRESULT RawBuffer(Variant& units, typename Text::value_type** out) {
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    Text* held = std::get_if<Text>(&units);
+    *out = held == nullptr ? nullptr : held->data();
+    return held == nullptr ? NCF_E_FAIL : NCF_OK;
+}
+
+}  // namespace
+
+ncfUInt32 String::GetLength() {
+    return std::visit([](const auto& text) { return static_cast<ncfUInt32>(text.size()); }, units_);
+}
+
+ncfBool String::IsEmpty() {
+    return GetLength() == 0 ? 1 : 0;
+}
+
+std::u32string String::Text() const {
+    return std::visit(
+        [](const auto& text) -> std::u32string {
+            using Held = std::decay_t<decltype(text)>;
+            if constexpr (std::is_same_v<Held, std::string>) {
+                return text::FromUtf8(text);
+            } else if constexpr (std::is_same_v<Held, std::u16string>) {
+                return text::FromUtf16(text);
+            } else if constexpr (std::is_same_v<Held, std::wstring>) {
+                return text::FromWide(text);
+            } else {
+                return text;
+            }
+        },
+        units_);
+}
+
+NCFRESULT String::SetText(std::u32string_view text, ncfUInt32 encoding) {
+    Units made;
+    bool placed = false;
+    switch (encoding) {
+        case kNCFASCII:
+            placed = text::ToAscii(text, made.emplace<std::string>());
+            break;
+        case kNCFUTF8:
+            placed = text::ToUtf8(text, made.emplace<std::string>());
+            break;
+        case kNCFUTF16:
+            placed = text::ToUtf16(text, made.emplace<std::u16string>());
+            break;
+        case kNCFUTF32:
+            placed = text::ToUtf32(text, made.emplace<std::u32string>());
+            break;
+        case kNCFWCHAR:
+            placed = text::ToWide(text, made.emplace<std::wstring>());
+            break;
+        default:
+            return NCF_E_INVALIDARG;
+    }
+    if (!placed) {
+        return NCF_E_FAIL;
+    }
+    units_ = std::move(made);
+    encoding_ = encoding;
+    return NCF_OK;
+}
+
+NCFRESULT String::Assign(INCFString* source) {
+    return Guarded([&]() -> NCFRESULT {
+        if (source == nullptr) {
+            return NCF_E_POINTER;
+        }
+        return SetText(text::Read(source), source->GetEncoding());
+    });
+}
+
+NCFRESULT String::AssignUTF8(ncfUInt32 keepAs, const ncfUTF8* text, ncfUInt32 units) {
+    return Guarded([&]() -> NCFRESULT {
+        std::string_view view;
+        const NCFRESULT result = View(text, units, view);
+        return result < 0 ? result : SetText(text::FromUtf8(view), keepAs);
+    });
+}
+
+NCFRESULT String::AssignUTF16(ncfUInt32 keepAs, const ncfUTF16* text, ncfUInt32 units) {
+    return Guarded([&]() -> NCFRESULT {
+        std::u16string_view view;
+        const NCFRESULT result = View(text, units, view);
+        return result < 0 ? result : SetText(text::FromUtf16(view), keepAs);
+    });
+}
+
+NCFRESULT String::AssignWCHAR(ncfUInt32 keepAs, const ncfWCHAR* text, ncfUInt32 units) {
+    return Guarded([&]() -> NCFRESULT {
+        std::wstring_view view;
+        const NCFRESULT result = View(text, units, view);
+        return result < 0 ? result : SetText(text::FromWide(view), keepAs);
+    });
+}
+
+NCFRESULT String::ConvertTo(ncfUInt32 encoding) {
+    if (encoding == encoding_) {
+        return NCF_OK;
+    }
+    return Guarded([&] { return SetText(Text(), encoding); });
+}
+
+NCFRESULT String::ConvertCopy(ncfUInt32 encoding, INCFString** out) {
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    *out = nullptr;
+    return Guarded([&] {
+        Ref<String> copy = MakeRef<String>();
+        const NCFRESULT result = copy->SetText(Text(), encoding);
+        if (result >= 0) {
+            *out = copy.Detach();
+        }
+        return result;
+    });
+}
+
+NCFRESULT String::GetRawUTF8(ncfUTF8** out) {
+    return RawBuffer<std::string>(units_, out);
+}
+
+NCFRESULT String::GetRawUTF16(ncfUTF16** out) {
+    return RawBuffer<std::u16string>(units_, out);
+}
+
+NCFRESULT String::GetRawUTF32(ncfUTF32** out) {
+    return RawBuffer<std::u32string>(units_, out);
+}
+
+NCFRESULT String::GetRawWCHAR(ncfWCHAR** out) {
+    return RawBuffer<std::wstring>(units_, out);
+}
+
+Ref<String> MakeString(std::u32string_view text, ncfUInt32 encoding) {
+    Ref<String> string = MakeRef<String>();
+    string->SetText(text, encoding);
+    return string;
+}
+
+Ref<String> MakeString(std::string_view utf8, ncfUInt32 encoding) {
+    return MakeString(text::FromUtf8(utf8), encoding);
+}
+
+NCFRESULT GiveString(std::u32string_view text, INCFString** out) {
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    *out = nullptr;
+    return Guarded([&] {
+        *out = MakeString(text).Detach();
+        return NCF_OK;
+    });
+}
+
+NCFRESULT GiveString(std::string_view utf8, INCFString** out) {
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    *out = nullptr;
+    return Guarded([&] {
+        *out = MakeString(utf8).Detach();
+        return NCF_OK;
+    });
+}
+
+}  // namespace host
