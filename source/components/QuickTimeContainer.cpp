@@ -103,10 +103,10 @@ NCFRESULT QuickTimeContainer::SetFilePath(INCFString* path) {
     NCF_FUNCTION("NMA::Impl::QuickTimeContainer::SetFilePath");
     return InterfaceEntry([&]() -> NCFRESULT {
         if (!filePath_.isNull() && !filePath_->IsEmpty()) {
-            throw NMA_E_ALREADYSET;
+            ThrowIfFailed(NMA_E_ALREADYSET);
         }
         if (!path) {
-            throw NCF_E_POINTER;
+            ThrowIfFailed(NCF_E_POINTER);
         }
         ThrowIfFailed(path->ConvertCopy(kNCFWCHAR, filePath_.outArg()));
         NCF_RETURN(ConvertSlashesInPlace(filePath_));

@@ -40,7 +40,7 @@ enum LevelConversion : ncfUInt32 {
     Default_Levels = 16,
 };
 
-enum ColorSpace : ncfUInt32 {
+enum : ncfUInt32 {  // colour space
     CS_MONO = 1,
     CS_RGB = 2,
     CS_YCbCr_601 = 4,

@@ -1,0 +1,256 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "source/parameters/NMAXmlNode.h"
+
+#include <algorithm>
+#include <memory>
+
+#include "source/parameters/NMAXmlElement.h"
+#include "source/parameters/NMAXmlLeaves.h"
+#include "source/plugin/ResultChecks.h"
+
+namespace NMA::XMLUtils {
+namespace {
+
+// Two references stand for one host node when their identities are equal.
+bool IsSameHostNode(IXmlNode* left, IXmlNode* right) {
+    if (!left || !right) {
+        return false;
+    }
+    NCFSmartPtr<INCFUnknown> leftIdentity;
+    NCFSmartPtr<INCFUnknown> rightIdentity;
+    ThrowIfFailed(ncfQuery(left, leftIdentity));
+    ThrowIfFailed(ncfQuery(right, rightIdentity));
+    return leftIdentity == rightIdentity;
+}
+
+// An empty node of the same class, to be filled by CopyTo.
+std::unique_ptr<NMAXmlNode> MakeAlike(const NMAXmlNode& node) {
+    if (dynamic_cast<const NMAXmlElement*>(&node)) {
+        return std::make_unique<NMAXmlElement>();
+    }
+    if (dynamic_cast<const NMAXmlAttribute*>(&node)) {
+        return std::make_unique<NMAXmlAttribute>();
+    }
+    if (dynamic_cast<const NMAXmlText*>(&node)) {
+        return std::make_unique<NMAXmlText>();
+    }
+    if (dynamic_cast<const NMAXmlCDATA*>(&node)) {
+        return std::make_unique<NMAXmlCDATA>();
+    }
+    ThrowIfFailed(NCF_E_UNEXPECTED);
+    return nullptr;
+}
+
+}  // namespace
+
+NMAXmlNode::~NMAXmlNode() {
+    deleteChildren();
+}
+
+void NMAXmlNode::deleteChildren() {
+    for (NMAXmlNode* child : children_) {
+        delete child;
+    }
+    children_.clear();
+}
+
+NMAXmlNode* NMAXmlNode::Wrap(IXmlNode* hostNode) {
+    if (!hostNode) {
+        ThrowIfFailed(NCF_E_INVALIDARG);
+    }
+    switch (hostNode->GetType()) {
+        case kXmlElement:
+            return new NMAXmlElement(hostNode);
+        case kXmlAttribute:
+            return new NMAXmlAttribute(hostNode);
+        case kXmlText:
+            return new NMAXmlText(hostNode);
+        case kXmlCDATA:
+            return new NMAXmlCDATA(hostNode);
+        default:
+            return nullptr;
+    }
+}
+
+IXmlNode* NMAXmlNode::RequireHostNode() const {
+    if (hostNode_.isNull()) {
+        ThrowIfFailed(NMA_E_NOTINITIALIZED);
+    }
+    return hostNode_.inArg();
+}
+
+void NMAXmlNode::appendWrapped(IXmlNode* hostChild) {
+    std::unique_ptr<NMAXmlNode> child(Wrap(hostChild));
+    if (child) {
+        child->parent_ = this;
+        children_.push_back(child.get());
+        child.release();
+    }
+}
+
+void NMAXmlNode::LoadChildren() {
+    if (state_ != kUnread) {
+        return;
+    }
+    IXmlNode* const host = RequireHostNode();
+    deleteChildren();
+    if (host->HasAttributes()) {
+        NCFSmartPtr<IXmlAttributeList> attributes;
+        ThrowIfFailed(host->GetAttributes(attributes.outArg()));
+        const ncfUInt32 count = attributes->GetCount();
+        for (ncfUInt32 i = 0; i < count; ++i) {
+            NCFSmartPtr<IXmlNode> attribute;
+            ThrowIfFailed(attributes->GetItem(i, attribute.outArg()));
+            appendWrapped(attribute.inArg());
+        }
+    }
+    const ncfUInt32 count = host->GetChildCount();
+    for (ncfUInt32 i = 0; i < count; ++i) {
+        NCFSmartPtr<IXmlNode> child;
+        ThrowIfFailed(host->GetChild(i, child.outArg()));
+        appendWrapped(child.inArg());
+    }
+    state_ = kInStep;
+}
+
+void NMAXmlNode::SetChanged() {
+    state_ = kChanged;
+}
+
+void NMAXmlNode::CopyTo(NMAXmlNode& target) {
+    target.Reset();
+    target.hostNode_ = hostNode_;
+    target.parent_ = parent_;
+    target.origin_ = origin_;
+    target.state_ = state_;
+    for (NMAXmlNode* child : children_) {
+        std::unique_ptr<NMAXmlNode> copy = MakeAlike(*child);
+        child->CopyTo(*copy);
+        copy->parent_ = &target;
+        target.children_.push_back(copy.get());
+        copy.release();
+    }
+}
+
+void NMAXmlNode::Reset() {
+    hostNode_ = nullptr;
+    state_ = kUnread;
+    deleteChildren();
+}
+
+void NMAXmlNode::MarkDeleted() {
+    state_ = kDeleted;
+}
+
+std::size_t NMAXmlNode::findHostChild(IXmlNode* hostNode) const {
+    for (std::size_t i = 0; i < children_.size(); ++i) {
+        if (IsSameHostNode(children_[i]->HostNode(), hostNode)) {
+            return i;
+        }
+    }
+    return children_.size();
+}
+
+void NMAXmlNode::AddChild(NMAXmlNode* node) {
+    if (!node) {
+        ThrowIfFailed(NCF_E_INVALIDARG);
+    }
+    LoadChildren();
+    if (findHostChild(node->HostNode()) < children_.size()) {
+        ThrowIfFailed(NCF_E_UNEXPECTED);
+    }
+    node->parent_ = this;
+    children_.push_back(node);
+    SetChanged();
+}
+
+NMAXmlNode* NMAXmlNode::GetOrAddChildForHostNode(IXmlNode* hostNode) {
+    if (!hostNode) {
+        ThrowIfFailed(NCF_E_INVALIDARG);
+    }
+    LoadChildren();
+    const std::size_t found = findHostChild(hostNode);
+    if (found < children_.size()) {
+        return children_[found];
+    }
+    std::unique_ptr<NMAXmlNode> child(Wrap(hostNode));
+    if (!child) {
+        return nullptr;
+    }
+    AddChild(child.get());
+    return child.release();
+}
+
+void NMAXmlNode::RemoveChild(NMAXmlNode* node) {
+    if (!node) {
+        ThrowIfFailed(NCF_E_INVALIDARG);
+    }
+    LoadChildren();
+    const auto found = std::find(children_.begin(), children_.end(), node);
+    if (found != children_.end()) {
+        children_.erase(found);
+        SetChanged();
+    }
+}
+
+void NMAXmlNode::RemoveChildForHostNode(IXmlNode* hostNode) {
+    if (!hostNode) {
+        ThrowIfFailed(NCF_E_INVALIDARG);
+    }
+    LoadChildren();
+    const std::size_t found = findHostChild(hostNode);
+    if (found == children_.size()) {
+        ThrowIfFailed(NMA_E_NODATA);
+    }
+    const std::unique_ptr<NMAXmlNode> child(children_[found]);
+    RemoveChild(child.get());
+}
+
+void NMAXmlNode::Refresh() {
+    if (state_ == kInStep) {
+        return;
+    }
+    RequireHostNode();
+    state_ = kUnread;
+    LoadChildren();
+}
+
+void NMAXmlNode::DiscardNewChildren() {
+    LoadChildren();
+    for (std::size_t i = 0; i < children_.size();) {
+        if (children_[i]->origin_ == kOriginMemory) {
+            delete children_[i];
+            children_.erase(children_.begin() + static_cast<std::ptrdiff_t>(i));
+        } else {
+            children_[i]->DiscardNewChildren();
+            ++i;
+        }
+    }
+    state_ = kInStep;
+}
+
+void NMAXmlNode::DropChildAt(std::size_t index) {
+    NMAXmlNode* const child = children_[index];
+    if (child->origin_ == kOriginMemory) {
+        children_.erase(children_.begin() + static_cast<std::ptrdiff_t>(index));
+        delete child;
+    } else {
+        child->MarkDeleted();
+    }
+}
+
+void NMAXmlNode::GetNodeName(NMAString& out) {
+    NCFSmartPtr<INCFString> name;
+    ThrowIfFailed(RequireHostNode()->GetName(name.outArg()));
+    out = NMAString(name.inArg(), kNCFUTF16);
+}
+
+void NMAXmlNode::GetNodeValue(NMAString& out) {
+    NCFSmartPtr<INCFString> value;
+    ThrowIfFailed(RequireHostNode()->GetValue(value.outArg()));
+    out = NMAString(value.inArg(), kNCFUTF16);
+}
+
+}  // namespace NMA::XMLUtils
