@@ -56,7 +56,7 @@ public:
     const Entries& AllEntries() const { return entries_; }
 
 private:
-    XMLDataPropertyValue* FindValueParent() const;
+    bool FindValueParent(XMLDataPropertyValue** valueParent) const;
     XMLDataPropertyValue* MakeValueNode(const XMLDataPropertyDescription* description);
     void AddValueElement(const XMLDataPropertyDescription* description,
                          XMLDataPropertyValue* valueParent);

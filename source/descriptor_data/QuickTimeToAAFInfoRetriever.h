@@ -5,6 +5,7 @@
 #include "host_interfaces/framework/ComponentFactory.h"
 #include "host_interfaces/framework/Console.h"
 #include "host_interfaces/util/NMAString.h"
+#include "source/clips/Rational.h"
 #include "source/descriptor_data/AAFInfo.h"
 #include "source/descriptor_data/FourCharDataContainerReader.h"
 #include "source/descriptor_data/GenericXMLDataContainer.h"
@@ -31,7 +32,7 @@ public:
     // Fills `aafInfo`, which may be null, for the picture of `media`. `vcid` is
     // written also where the record can't be filled. 0: a natively served
     // picture; NCF_E_NOTSUPPORTED: the code or its geometry is unknown.
-    NCFRESULT GetInfoFromImageDescription(BaseClip* media, AAFInfo* aafInfo, ncfUInt32* vcid);
+    NCFRESULT GetInfoFromImageDescription(const BaseClip* media, AAFInfo* aafInfo, ncfUInt32* vcid);
 
     // Kind of the record that this thread read last: to be asked right after
     // GetInfoFromImageDescription.
@@ -50,7 +51,17 @@ private:
                                 const NMAString& fourCharPath, const NMAString& aafInfoPath);
     ~QuickTimeToAAFInfoRetriever() = default;
 
+    // What the record of a picture is looked up by.
+    struct Query {
+        ncfUInt32 vcid;
+        Rational editRate;
+        ncfUInt32 width;
+        ncfUInt32 height;  // of a field where the picture is stored in fields
+    };
+    NCFRESULT FillInfo(const Query& query, AAFInfo& aafInfo);
+    NCFRESULT ReadRecord(const Query& query, AAFInfo& aafInfo, const char** failedCall);
     void ReportUnknownCode(ncfUInt32 fourCC);
+    void ReportUnknownId(const Query& query);
 
     INCFComponentFactory* m_factory;  // borrowed: the host outlives the module
     GenericXMLDataContainer m_dataContainer;

@@ -16,12 +16,18 @@ enum DataContainerElementKind : ncfUInt32 {
 // Name and kind of one declared element; fixed once made.
 class XMLDataPropertyDescription {
 public:
-    XMLDataPropertyDescription(const NMAString& name, ncfUInt32 kind) : name_(name), kind_(kind) {}
+    XMLDataPropertyDescription(const NMAString& name, ncfUInt32 kind)
+        : name_(name), kind_(kind), nameText_(name_.GetUTF8String()) {}
+    XMLDataPropertyDescription(const XMLDataPropertyDescription&) = delete;
+    XMLDataPropertyDescription& operator=(const XMLDataPropertyDescription&) = delete;
 
     const NMAString& GetName() const { return name_; }
     ncfUInt32 GetKind() const { return kind_; }
+    // The name as searches compare it.
+    const char* NameText() const { return nameText_; }
 
 private:
     const NMAString name_;
     const ncfUInt32 kind_;
+    const char* const nameText_;  // lies in name_
 };

@@ -35,6 +35,8 @@ public:
     NCFRESULT FindPropertyInChildren(const char* property,
                                      XMLDataPropertyValue** dataPropertyValue) const;
 
+    // The value in UTF-8, valid until it is set anew.
+    const char* ValueText() const { return value_.GetUTF8String(); }
     const std::vector<XMLDataPropertyValue*>& Children() const { return children_; }
 
 private:
