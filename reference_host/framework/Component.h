@@ -39,7 +39,7 @@ public:
     ncfUInt32 AddRef() override { return references_.fetch_add(1, std::memory_order_relaxed) + 1; }
 
     ncfUInt32 Release() override {
-        const ncfUInt32 left = references_.fetch_sub(1, std::memory_order_acq_rel) - 1;
+        const ncfUInt32 left = DropReference();
         if (left == 0) {
             delete this;
         }
@@ -52,6 +52,9 @@ public:
 protected:
     Component() = default;
     virtual ~Component() = default;
+
+    // Takes one reference away and ends nothing: for a Release of another kind.
+    ncfUInt32 DropReference() { return references_.fetch_sub(1, std::memory_order_acq_rel) - 1; }
 
     // The interface's address without a new reference, null when there is none.
     virtual void* FindInterface(const GUID& iid) {

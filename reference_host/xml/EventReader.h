@@ -1,0 +1,49 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <memory>
+#include <string>
+#include <string_view>
+
+#include "host_interfaces/framework/ResultCodes.h"
+
+namespace host {
+
+// Receives what an EventReader meets. Texts are UTF-8 and valid for the call
+// only. A negative result ends the reading; a thrown one does the same.
+class XmlEvents {
+public:
+    virtual ~XmlEvents() = default;
+    // `attributes` are names and values by turns, closed by a null.
+    virtual NCFRESULT OnElement(const char* name, const char** attributes) = 0;
+    // A whole run of text between two marks, white space included. Entities,
+    // CDATA sections and the ends of buffers don't split it; comments do.
+    virtual NCFRESULT OnText(std::string_view text) = 0;
+};
+
+// Checks a document that comes in pieces, and tells of it. Anything that is
+// not well-formed, any document type declaration (and so every entity of the
+// document's own) and anything beyond the limits ends it.
+class EventReader {
+public:
+    // `encoding` overrides what the document says of itself; null: it decides.
+    EventReader(XmlEvents& events, const char* encoding);
+    ~EventReader();
+    EventReader(const EventReader&) = delete;
+    EventReader& operator=(const EventReader&) = delete;
+
+    // The first failure is the result of this and every later call.
+    NCFRESULT Feed(const char* bytes, std::size_t size, bool last);
+
+    // "line:column: what is wrong", empty without a failure.
+    const std::string& problem() const;
+    // Whether the failure came from the events' receiver and not the document.
+    bool refusedByReceiver() const;
+
+private:
+    struct State;
+    std::unique_ptr<State> state_;
+};
+
+}  // namespace host
