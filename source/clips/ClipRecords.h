@@ -5,11 +5,12 @@
 #include "host_interfaces/framework/String.h"
 #include "source/clips/Rational.h"
 #include "source/plugin/NCFSmartPtr.h"
+#include "source/plugin/PixelEnums.h"
 
 // Plain records in which a clip hands out what it knows.
 
 // A picture property that the clip has not determined.
-inline constexpr ncfUInt32 kPropertyNotSet = 0x7FFFFFFFu;
+inline constexpr ncfUInt32 kPropertyNotSet = kNotSet;
 
 // Which field of a frame comes first in time.
 enum TemporalFieldOrder : ncfUInt32 {
@@ -23,13 +24,6 @@ enum TemporalFieldOrder : ncfUInt32 {
 enum FrameBufferLayout : ncfUInt32 {
     kLayoutMerged = 256,
     kLayoutSplit = 512,
-};
-
-enum ColorSpace : ncfUInt32 {
-    kColorSpaceMono = 1,
-    kColorSpaceRGB = 2,
-    kColorSpaceYCbCr601 = 4,
-    kColorSpaceYCbCr709 = 8,
 };
 
 // Kind of a track of the movie.

@@ -1,0 +1,132 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// The bytes that give a movie its identity: the whole movie header, then at
+// most a mebibyte from the middle of each track. Few reads tell even large
+// movies apart, and the same file gives the same bytes on every machine.
+
+#include <algorithm>
+
+#include "public_include/SimpleFileIO.h"
+#include "source/clips/QuickTimeClip.h"
+#include "source/plugin/ResultChecks.h"
+
+namespace {
+
+constexpr ncfUInt64 maxChunkSize = 1048576;
+
+// Largest range that one read can fetch.
+constexpr ncfUInt64 kLargestRead = 0xFFFFFFFF;
+
+// Reads a range and appends all of it; a range that the file can't fill is
+// refused. An empty one adds nothing.
+NCFRESULT AppendRange(const char* ncfFunction, NMA::Impl::SimpleFileIO& file_reader,
+                      ncfUInt64 offset, ncfUInt64 size, std::vector<ncfUInt8>& local,
+                      std::vector<ncfUInt8>& content) {
+    if (size == 0) {
+        return NCF_OK;
+    }
+    if (size > kLargestRead) {
+        return NCF_E_FAIL;
+    }
+    const auto wanted = static_cast<ncfUInt32>(size);
+    local.resize(wanted);
+    ncfUInt32 actualRead = 0;
+    NCF_RETURN_TEXT("file_reader.Read(offset, &local[0], size, &actualRead)",
+                    file_reader.Read(offset, local.data(), wanted, &actualRead));
+    if (actualRead != wanted) {
+        return NCF_E_FAIL;
+    }
+    content.insert(content.end(), local.begin(), local.end());
+    return NCF_OK;
+}
+
+}  // namespace
+
+NCFRESULT QuickTimeClip::GetContentForHash(std::vector<ncfUInt8>& content) {
+    NCF_FUNCTION("QuickTimeClip::GetContentForHash");
+    content.clear();
+    NMA::Impl::SimpleFileIO file_reader(fileName_.inArg());
+    std::vector<ncfUInt8> local;
+    ncfUInt64 offset = 0;
+    ncfUInt64 size = 0;
+    NCF_RETURN(qtParser_->GetMOOVAtom(&offset, &size));
+    NCFRESULT result = AppendRange(ncfFunction, file_reader, offset, size, local, content);
+    if (result < 0) {
+        return result;
+    }
+    std::vector<NCFSmartPtr<ITrackInfo>> tracks;
+    result = GatherTracks(tracks);
+    if (result < 0) {
+        return result;
+    }
+    // The chunks of other movies may lie in other files.
+    ncfBool isSelfContained = 0;
+    NCF_RETURN(qtParser_->IsMovieSelfContained(&isSelfContained));
+    if (!isSelfContained) {
+        return NCF_OK;
+    }
+    for (std::size_t i = 0; i < tracks.size(); ++i) {
+        NCFSmartPtr<IQTSampleTable> pTable;
+        ncfUInt64 numSamples = 0;
+        NCF_RETURN_TEXT("tracks[i]->GetSampleTable(&pTable)",
+                        tracks[i]->GetSampleTable(pTable.outArg()));
+        NCF_RETURN(pTable->GetNumSamples(&numSamples));
+        if (numSamples == 0) {
+            continue;
+        }
+        NCF_RETURN(pTable->GetChunkFromTheMiddle(&offset, &size));
+        size = std::min(size, maxChunkSize);
+        ncfUInt64 streamLength = 0;
+        NCF_RETURN(file_reader.GetLength(&streamLength));
+        if (offset > streamLength || size > streamLength - offset) {
+            // A file that was cut short may still have its beginning.
+            pTable->GetDataOffset(1, &offset);
+        }
+        result = AppendRange(ncfFunction, file_reader, offset, size, local, content);
+        if (result < 0) {
+            return result;
+        }
+    }
+    return NCF_OK;
+}
+
+NCFRESULT QuickTimeClip::GatherTracks(std::vector<NCFSmartPtr<ITrackInfo>>& tracks) {
+    NCF_FUNCTION("QuickTimeClip::GetContentForHash");
+    ncfUInt32 trackCount = 0;
+    NCF_RETURN(qtParser_->GetVideoTrackCount(&trackCount));
+    for (ncfUInt32 i = 0; i < trackCount; ++i) {
+        NCFSmartPtr<IVideoTrackInfo> pVideoTrack;
+        NCFSmartPtr<ITrackInfo> pTrack;
+        NCF_RETURN_TEXT("qtParser_->GetVideoTrackInfo(i, &pVideoTrack)",
+                        qtParser_->GetVideoTrackInfo(i, pVideoTrack.outArg()));
+        NCF_RETURN_TEXT("pVideoTrack->QueryInterface(IID_ITrackInfo, (void**)pTrack.outArg())",
+                        ncfQuery(pVideoTrack.inArg(), IID_ITrackInfo, pTrack));
+        tracks.push_back(pTrack);
+    }
+    NCF_RETURN(qtParser_->GetAudioTrackCount(&trackCount));
+    for (ncfUInt32 i = 0; i < trackCount; ++i) {
+        NCFSmartPtr<IAudioTrackInfo> pAudioTrack;
+        NCFSmartPtr<ITrackInfo> pTrack;
+        NCF_RETURN_TEXT("qtParser_->GetAudioTrackInfo(i, &pAudioTrack)",
+                        qtParser_->GetAudioTrackInfo(i, pAudioTrack.outArg()));
+        NCF_RETURN_TEXT("pAudioTrack->QueryInterface(IID_ITrackInfo, (void**)pTrack.outArg())",
+                        ncfQuery(pAudioTrack.inArg(), IID_ITrackInfo, pTrack));
+        tracks.push_back(pTrack);
+    }
+    NCF_RETURN(qtParser_->GetTimeCodeTrackCount(&trackCount));
+    for (ncfUInt32 i = 0; i < trackCount; ++i) {
+        NCFSmartPtr<ITrackInfo> pTrack;
+        NCF_RETURN_TEXT("qtParser_->GetTimeCodeTrackInfo(i, &pTrack)",
+                        qtParser_->GetTimeCodeTrackInfo(i, pTrack.outArg()));
+        tracks.push_back(pTrack);
+    }
+    NCF_RETURN(qtParser_->GetOtherTrackCount(&trackCount));
+    for (ncfUInt32 i = 0; i < trackCount; ++i) {
+        NCFSmartPtr<ITrackInfo> pTrack;
+        NCF_RETURN_TEXT("qtParser_->GetOtherTrackInfo(i, &pTrack)",
+                        qtParser_->GetOtherTrackInfo(i, pTrack.outArg()));
+        tracks.push_back(pTrack);
+    }
+    return NCF_OK;
+}
