@@ -1,0 +1,37 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/framework/ResultCodes.h"
+#include "source/aaf/AAFSmartPointer.h"
+
+namespace NMA::Impl {
+
+// Length of the slots that end the chain in the source mob, whatever the
+// clip's own length.
+inline constexpr aafLength_t kNilReferenceLength = 12960000;
+
+// A slot's label from a format with one "%d"; shortened to what `room`
+// characters hold, terminator included.
+std::wstring SlotLabel(const aafCharacter* format, ncfUInt32 number, std::size_t room);
+
+// Adds `slotsToAdd` slots to all three mobs at once, with ids from
+// `totalExistingSlots` + 1 on: the master mob's slot refers to the file mob's
+// of the same id, that one to the source mob's, which refers to nothing.
+// Lengths are in edit units of `aaf_rate`, of sound too.
+NCFRESULT AddAAFTrack(const aafUID_t& dataDefUID, const aafCharacter* slotFormatLabel,
+                      ncfUInt32 slotsToAdd, ncfUInt32 startingSlot, ncfUInt32 totalExistingSlots,
+                      const aafRational_t& aaf_rate, aafLength_t movieLength,
+                      IAAFSmartPointer<IAAFDictionary> pDictionary,
+                      IAAFSmartPointer<IAAFMob> pMobMasterMob,
+                      IAAFSmartPointer<IAAFMasterMob> pMasterMob,
+                      IAAFSmartPointer<IAAFMob> pMobFileMob,
+                      IAAFSmartPointer<IAAFSourceMob> pFileMob,
+                      IAAFSmartPointer<IAAFMob> pMobSourceMob,
+                      IAAFSmartPointer<IAAFSourceMob> pSourceMob, aafPosition_t startTime);
+
+}  // namespace NMA::Impl
