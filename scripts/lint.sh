@@ -1,0 +1,28 @@
+#!/usr/bin/env bash
+# House rules that a machine can see.
+set -euo pipefail
+failed=0
+rule() { # rule MESSAGE GREP-ARGS...
+  local message=$1 hits
+  shift
+  if hits=$(git grep -nE "$@"); then
+    printf '%s:\n%s\n' "$message" "$hits"
+    failed=1
+  fi
+}
+
+rule 'source/ must not include the reference host' '#include "reference_host/' -- source host_interfaces public_include
+rule 'the reference host must not include source/' '#include "source/' -- reference_host host_interfaces
+rule 'system headers belong in source/plugin/os/' \
+  '#include <(windows|unistd|fcntl|dlfcn|pthread|sys/[a-z]+)\.h>' -- source public_include ':!source/plugin/os'
+rule 'throw typed codes, never literals or raw results' 'throw (0x|-?[0-9]|hr\b|\(?HRESULT)' -- source
+rule 'a long text has no fixed width here' '\b(unsigned )?long [a-z_A-Z]+ *(=|;|,|\))' -- source
+
+mapfile -t files < <(git ls-files '*.h' '*.cpp')
+if ! bad=$(clang-format --dry-run -Werror "${files[@]}" 2>&1); then
+  printf '%s\n' "$bad" | grep -E 'error:' | cut -d: -f1 | sort | uniq -c | sort -rn | head -20
+  echo 'run clang-format -i on these files'
+  failed=1
+fi
+((failed == 0)) && echo 'lint: nothing to say'
+exit $failed
