@@ -88,28 +88,28 @@ std::vector<GUID> ids(const StoredObject& object, std::uint16_t pid) {
     return out;
 }
 
-std::vector<MemberRecord> named(std::vector<std::u16string> memberNames, std::size_t values) {
+std::vector<MetaMember> named(std::vector<std::u16string> memberNames, std::size_t values) {
     if (memberNames.size() != values) {
         throw StoredError(std::to_string(memberNames.size()) + " names for " +
                           std::to_string(values) + " members");
     }
-    std::vector<MemberRecord> members(values);
+    std::vector<MetaMember> members(values);
     for (std::size_t i = 0; i < values; ++i) {
         members[i].name = std::move(memberNames[i]);
     }
     return members;
 }
 
-std::vector<MemberRecord> withIds(std::vector<std::u16string> memberNames,
-                                  const std::vector<GUID>& values) {
-    std::vector<MemberRecord> members = named(std::move(memberNames), values.size());
+std::vector<MetaMember> withIds(std::vector<std::u16string> memberNames,
+                                const std::vector<GUID>& values) {
+    std::vector<MetaMember> members = named(std::move(memberNames), values.size());
     for (std::size_t i = 0; i < values.size(); ++i) {
         members[i].id = values[i];
     }
     return members;
 }
 
-std::vector<MemberRecord> enumerationMembers(const StoredObject& object) {
+std::vector<MetaMember> enumerationMembers(const StoredObject& object) {
     std::vector<std::u16string> memberNames = names(object, meta::enumerationNames);
     std::vector<std::int64_t> values;
     if (const StoredProperty* stored = find(object, meta::enumerationValues, StoredForm::Data)) {
@@ -118,14 +118,14 @@ std::vector<MemberRecord> enumerationMembers(const StoredObject& object) {
             values.push_back(from.number<std::int64_t>());
         }
     }
-    std::vector<MemberRecord> members = named(std::move(memberNames), values.size());
+    std::vector<MetaMember> members = named(std::move(memberNames), values.size());
     for (std::size_t i = 0; i < values.size(); ++i) {
         members[i].value = values[i];
     }
     return members;
 }
 
-std::vector<MemberRecord> recordMembers(const StoredObject& object) {
+std::vector<MetaMember> recordMembers(const StoredObject& object) {
     std::vector<GUID> types;
     if (const StoredProperty* stored =
             find(object, meta::recordMemberTypes, StoredForm::WeakVector)) {
@@ -136,7 +136,7 @@ std::vector<MemberRecord> recordMembers(const StoredObject& object) {
     return withIds(names(object, meta::recordMemberNames), types);
 }
 
-void readMembers(const StoredObject& object, TypeRecord& record) {
+void readMembers(const StoredObject& object, MetaType& record) {
     switch (record.kind) {
         case TypeKind::Integer:
             record.size = requiredNumber<std::uint8_t>(object, meta::integerSize);
@@ -165,8 +165,8 @@ void readMembers(const StoredObject& object, TypeRecord& record) {
     }
 }
 
-PropertyRecord readProperty(const StoredObject& object) {
-    PropertyRecord record;
+MetaProperty readProperty(const StoredObject& object) {
+    MetaProperty record;
     record.id = guidOf(requiredData(object, meta::identification));
     record.name = nameOf(object);
     record.type = guidOf(requiredData(object, meta::propertyType));
@@ -176,8 +176,8 @@ PropertyRecord readProperty(const StoredObject& object) {
     return record;
 }
 
-ClassRecord readClass(const StoredObject& object) {
-    ClassRecord record;
+MetaClass readClass(const StoredObject& object) {
+    MetaClass record;
     record.id = guidOf(requiredData(object, meta::identification));
     record.name = nameOf(object);
     record.parent = requiredTarget(object, meta::parentClass);
@@ -190,8 +190,8 @@ ClassRecord readClass(const StoredObject& object) {
     return record;
 }
 
-TypeRecord readType(const StoredObject& object, const TypeKindClass& kind) {
-    TypeRecord record;
+MetaType readType(const StoredObject& object, const TypeKindClass& kind) {
+    MetaType record;
     record.id = guidOf(requiredData(object, meta::identification));
     record.name = nameOf(object);
     record.kind = kind.kind;

@@ -72,7 +72,7 @@ void addTo(StoredProperty& set, const GUID& id, StoredObject definition) {
     set.objects.push_back(std::move(definition));
 }
 
-StoredObject storedProperty(const PropertyRecord& record) {
+StoredObject storedProperty(const MetaProperty& record) {
     Definition definition(propertyDefinitionClass, record.id, record.name);
     definition.data(meta::propertyType, idBytes(record.type));  // an id, no weak reference
     definition.flag(meta::isOptional, record.optional);
@@ -83,12 +83,12 @@ StoredObject storedProperty(const PropertyRecord& record) {
     return definition.take();
 }
 
-StoredObject storedClass(const ClassRecord& record) {
+StoredObject storedClass(const MetaClass& record) {
     Definition definition(classDefinitionClass, record.id, record.name);
     definition.weak(meta::parentClass, record.parent, classPath);
     if (!record.properties.empty()) {
         StoredProperty properties = definitionSet(meta::properties, u"Properties");
-        for (const PropertyRecord& property : record.properties) {
+        for (const MetaProperty& property : record.properties) {
             addTo(properties, property.id, storedProperty(property));
         }
         definition.set(std::move(properties));
@@ -97,33 +97,33 @@ StoredObject storedClass(const ClassRecord& record) {
     return definition.take();
 }
 
-Bytes memberNames(const TypeRecord& record) {
+Bytes memberNames(const MetaType& record) {
     ByteWriter names;
-    for (const MemberRecord& member : record.members) {
+    for (const MetaMember& member : record.members) {
         names.text(member.name);
     }
     return names.bytes();
 }
 
-Bytes memberIds(const TypeRecord& record) {
+Bytes memberIds(const MetaType& record) {
     ByteWriter ids;
-    for (const MemberRecord& member : record.members) {
+    for (const MetaMember& member : record.members) {
         ids.append(storedAuid(member.id));
     }
     return ids.bytes();
 }
 
-Bytes memberValues(const TypeRecord& record) {
+Bytes memberValues(const MetaType& record) {
     ByteWriter values;
-    for (const MemberRecord& member : record.members) {
+    for (const MetaMember& member : record.members) {
         values.number(member.value);
     }
     return values.bytes();
 }
 
-void addRecordMembers(Definition& definition, const TypeRecord& record) {
+void addRecordMembers(Definition& definition, const MetaType& record) {
     std::vector<Bytes> types;
-    for (const MemberRecord& member : record.members) {
+    for (const MetaMember& member : record.members) {
         types.push_back(idBytes(member.id));
     }
     definition.weak(meta::recordMemberTypes, StoredForm::WeakVector, u"MemberTypes",
@@ -131,7 +131,7 @@ void addRecordMembers(Definition& definition, const TypeRecord& record) {
     definition.data(meta::recordMemberNames, memberNames(record));
 }
 
-StoredObject storedType(const TypeRecord& record) {
+StoredObject storedType(const MetaType& record) {
     Definition definition(typeDefinitionClass(record.kind), record.id, record.name);
     if (const std::uint16_t pid = kindClass(record.kind).targetPid; pid != 0) {
         definition.weak(pid, record.target, refersToClass(record.kind) ? classPath : typePath);
@@ -168,11 +168,11 @@ StoredObject storedType(const TypeRecord& record) {
 
 StoredObject storedMetaDictionary(const MetaRecords& records) {
     StoredProperty classes = definitionSet(meta::classDefinitions, u"ClassDefinitions");
-    for (const ClassRecord& record : records.classes) {
+    for (const MetaClass& record : records.classes) {
         addTo(classes, record.id, storedClass(record));
     }
     StoredProperty types = definitionSet(meta::typeDefinitions, u"TypeDefinitions");
-    for (const TypeRecord& record : records.types) {
+    for (const MetaType& record : records.types) {
         addTo(types, record.id, storedType(record));
     }
     StoredObject dictionary;

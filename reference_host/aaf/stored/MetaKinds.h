@@ -20,6 +20,7 @@ extern const GUID classDefinitionClass;
 extern const GUID propertyDefinitionClass;
 extern const GUID metaDictionaryClass;
 
+Span<TypeKindClass> allKindClasses();
 const TypeKindClass& kindClass(TypeKind kind);
 const TypeKindClass* findKindClass(const GUID& definitionClass);
 

@@ -42,6 +42,10 @@ const GUID classDefinitionClass = metaClass(0x0201);
 const GUID propertyDefinitionClass = metaClass(0x0202);
 const GUID metaDictionaryClass = metaClass(0x0225);
 
+Span<TypeKindClass> allKindClasses() {
+    return {typeKinds, std::size(typeKinds)};
+}
+
 const TypeKindClass& kindClass(TypeKind kind) {
     return *std::find_if(std::begin(typeKinds), std::end(typeKinds),
                          [&](const TypeKindClass& entry) { return entry.kind == kind; });

@@ -15,7 +15,7 @@
 
 namespace aaf::stored {
 
-struct PropertyRecord {
+struct MetaProperty {
     GUID id{};
     std::u16string name;
     std::uint16_t pid = 0;
@@ -24,34 +24,34 @@ struct PropertyRecord {
     bool unique = false;
 };
 
-struct ClassRecord {
+struct MetaClass {
     GUID id{};
     std::u16string name;
     GUID parent{};  // its own id for a root class
     bool concrete = false;
-    std::vector<PropertyRecord> properties;
+    std::vector<MetaProperty> properties;
 };
 
-struct MemberRecord {
+struct MetaMember {
     std::u16string name;
     GUID id{};  // record: type of the member; extendible enumeration: value; weak reference:
                 // property on the path from the root to the set of targets
     std::int64_t value = 0;  // enumeration: value
 };
 
-struct TypeRecord {
+struct MetaType {
     GUID id{};
     std::u16string name;
     TypeKind kind = TypeKind::Integer;
     GUID target{};           // element, renamed or character type; class referred to
     std::uint32_t size = 0;  // integer: bytes; fixed array: elements
     bool isSigned = false;   // integer
-    std::vector<MemberRecord> members;
+    std::vector<MetaMember> members;
 };
 
 struct MetaRecords {
-    std::vector<ClassRecord> classes;
-    std::vector<TypeRecord> types;
+    std::vector<MetaClass> classes;
+    std::vector<MetaType> types;
 };
 
 // The object that the root holds as its MetaDictionary.

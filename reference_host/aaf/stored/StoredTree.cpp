@@ -20,7 +20,8 @@ bool operator==(const StoredObject& left, const StoredObject& right) {
 bool operator==(const StoredProperty& left, const StoredProperty& right) {
     return left.pid == right.pid && left.form == right.form && left.name == right.name &&
            left.bytes == right.bytes && left.objects == right.objects && left.keys == right.keys &&
-           left.keyPid == right.keyPid && left.targetPath == right.targetPath;
+           left.keyPid == right.keyPid && left.keySize == right.keySize &&
+           left.targetPath == right.targetPath;
 }
 
 }  // namespace aaf::stored

@@ -66,9 +66,11 @@ struct StoredProperty {
 
     // Strong set: the key of each object, beside `objects` (the object also
     // stores it as its own property `keyPid`). Weak forms: the keys of the
-    // targets; exactly one for a weak reference. Keys have 16 or 32 bytes.
+    // targets; exactly one for a weak reference. All keys have the same size,
+    // 16 (ids) or 32 bytes (mob ids).
     std::vector<Bytes> keys;
     std::uint16_t keyPid = 0;
+    std::uint8_t keySize = 16;
 
     // Weak forms: the pids from the root object down to the strong set that
     // holds the targets.

@@ -169,18 +169,17 @@ private:
         ByteReader from(index);
         const auto count = from.number<std::uint32_t>();
         from.bytes(8);  // which keys are free; only a writer would want to know
-        std::size_t keySize = 0;
         if (isSet) {
             property.keyPid = from.number<std::uint16_t>();
-            keySize = checkedKeySize(from.number<std::uint8_t>());
+            readKeySize(property, from);
         }
-        checkCount(count, from.left(), isSet ? 8 + keySize : 4);
+        checkCount(count, from.left(), isSet ? std::size_t{8} + property.keySize : 4);
         property.objects.reserve(count);
         for (std::uint32_t i = 0; i < count; ++i) {
             const auto localKey = from.number<std::uint32_t>();
             if (isSet) {
                 from.number<std::uint32_t>();  // the count of references
-                property.keys.push_back(from.bytes(keySize));
+                property.keys.push_back(from.bytes(property.keySize));
             }
             property.objects.push_back(contained(storage, elementName(name, localKey), depth));
         }
@@ -192,8 +191,8 @@ private:
     void readWeakReference(StoredProperty& property, const Bytes& value) {
         ByteReader from(value);
         readTarget(property, from);
-        const std::size_t keySize = checkedKeySize(from.number<std::uint8_t>());
-        property.keys.push_back(from.bytes(keySize));
+        readKeySize(property, from);
+        property.keys.push_back(from.bytes(property.keySize));
     }
 
     void readWeakCollection(const Entry& storage, StoredProperty& property, const Bytes& value) {
@@ -201,10 +200,10 @@ private:
         ByteReader from(index);
         const auto count = from.number<std::uint32_t>();
         readTarget(property, from);
-        const std::size_t keySize = checkedKeySize(from.number<std::uint8_t>());
-        checkCount(count, from.left(), keySize);
+        readKeySize(property, from);
+        checkCount(count, from.left(), property.keySize);
         for (std::uint32_t i = 0; i < count; ++i) {
-            property.keys.push_back(from.bytes(keySize));
+            property.keys.push_back(from.bytes(property.keySize));
         }
         if (property.form == StoredForm::WeakSet) {
             checkUnique(property.keys);
@@ -221,11 +220,11 @@ private:
         property.targetPath = paths_[tag];
     }
 
-    static std::size_t checkedKeySize(std::uint8_t size) {
-        if (!isKeySize(size)) {
-            throw StoredError("a key of " + std::to_string(size) + " bytes");
+    static void readKeySize(StoredProperty& property, ByteReader& from) {
+        property.keySize = from.number<std::uint8_t>();
+        if (!isKeySize(property.keySize)) {
+            throw StoredError("a key of " + std::to_string(property.keySize) + " bytes");
         }
-        return size;
     }
 
     static void checkCount(std::uint32_t count, std::size_t left, std::size_t each) {

@@ -105,14 +105,16 @@ Bytes nameValue(const std::u16string& name) {
     return ByteWriter().text(name).bytes();
 }
 
-std::uint8_t keySize(const std::vector<Bytes>& keys) {
-    const std::size_t size = keys.empty() ? auidKeySize : keys.front().size();
-    for (const Bytes& key : keys) {
-        if (!isKeySize(key.size()) || key.size() != size) {
+std::uint8_t checkedKeySize(const StoredProperty& property) {
+    if (!isKeySize(property.keySize)) {
+        throw StoredError("keys of " + std::to_string(property.keySize) + " bytes");
+    }
+    for (const Bytes& key : property.keys) {
+        if (key.size() != property.keySize) {
             throw StoredError("a key of " + std::to_string(key.size()) + " bytes");
         }
     }
-    return static_cast<std::uint8_t>(size);
+    return property.keySize;
 }
 
 class TreeWriter {
@@ -223,7 +225,7 @@ private:
         const auto count = static_cast<std::uint32_t>(order.size());
         ByteWriter index;
         index.number(count).number(count).number(noLastFreeKey);
-        index.number(property.keyPid).number(keySize(property.keys));
+        index.number(property.keyPid).number(checkedKeySize(property));
         for (std::uint32_t i = 0; i < count; ++i) {
             const StoredObject& object = property.objects[order[i]];
             const Bytes& key = property.keys[order[i]];
@@ -265,7 +267,7 @@ private:
         layout.add(property, ByteWriter()
                                  .number(paths_.tag(property.targetPath))
                                  .number(property.keyPid)
-                                 .number(keySize(property.keys))
+                                 .number(checkedKeySize(property))
                                  .append(property.keys.front())
                                  .bytes());
     }
@@ -278,7 +280,7 @@ private:
         ByteWriter index;
         index.number(static_cast<std::uint32_t>(property.keys.size()));
         index.number(paths_.tag(property.targetPath)).number(property.keyPid);
-        index.number(keySize(property.keys));
+        index.number(checkedKeySize(property));
         for (const Bytes& key : inOrder(property)) {
             index.append(key);
         }

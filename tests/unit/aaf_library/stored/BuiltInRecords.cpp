@@ -1,0 +1,47 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "tests/unit/aaf_library/stored/BuiltInRecords.h"
+
+#include <string>
+
+namespace aaf::stored::sample {
+
+namespace {
+
+std::u16string wide(const char* ascii) {
+    const std::string text(ascii);
+    return std::u16string(text.begin(), text.end());
+}
+
+}  // namespace
+
+MetaRecords builtInRecords() {
+    MetaRecords records;
+    std::uint16_t localPid = 0xFFFF;
+    for (const BuiltInClass& entry : BuiltInClasses()) {
+        MetaClass record{entry.id, wide(entry.name), entry.parent, entry.concrete, {}};
+        for (const BuiltInProperty& property : entry.properties) {
+            const std::uint16_t pid = property.pid != kNoPropertyId ? property.pid : localPid--;
+            record.properties.push_back({property.id, wide(property.name), pid, property.type,
+                                         property.optional, property.unique});
+        }
+        records.classes.push_back(record);
+    }
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        MetaType record;
+        record.id = entry.id;
+        record.name = wide(entry.symbol);
+        record.kind = entry.kind;
+        record.target = entry.target;
+        record.size = entry.size;
+        record.isSigned = entry.isSigned;
+        for (const BuiltInMember& member : entry.members) {
+            const bool named = entry.kind != TypeKind::WeakReference;
+            record.members.push_back({named ? wide(member.name) : u"", member.id, member.value});
+        }
+        records.types.push_back(record);
+    }
+    return records;
+}
+
+}  // namespace aaf::stored::sample

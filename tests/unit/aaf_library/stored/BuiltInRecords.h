@@ -1,0 +1,13 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "reference_host/aaf/stored/MetaRecords.h"
+
+namespace aaf::stored::sample {
+
+// The whole built-in model as the records of one file; local numbers are
+// given out as a file would do it.
+MetaRecords builtInRecords();
+
+}  // namespace aaf::stored::sample

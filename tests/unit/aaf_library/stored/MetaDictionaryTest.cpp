@@ -1,0 +1,191 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/aaf/stored/CompoundFileReader.h"
+#include "reference_host/aaf/stored/MetaPids.h"
+#include "reference_host/aaf/stored/StoredError.h"
+#include "reference_host/aaf/stored/TreeReader.h"
+#include "reference_host/aaf/stored/TreeWriter.h"
+#include "tests/unit/aaf_library/stored/BuiltInRecords.h"
+#include "tests/unit/aaf_library/stored/SampleTree.h"
+
+#include <gtest/gtest.h>
+#include <algorithm>
+
+using namespace aaf;
+using namespace aaf::stored;
+
+namespace {
+
+constexpr GUID quadId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E01");
+constexpr GUID rationalId = ncfGuid("03010100-0000-0000-060E-2B3401040101");
+
+MetaType quad() {
+    MetaType type;
+    type.id = quadId;
+    type.name = u"ExampleQuad";
+    type.kind = TypeKind::Record;
+    for (const char16_t* name : {u"Left", u"Top", u"Right", u"Bottom"}) {
+        type.members.push_back({name, rationalId, 0});
+    }
+    return type;
+}
+
+MetaRecords oneType(MetaType type) {
+    MetaRecords records;
+    records.types.push_back(std::move(type));
+    return records;
+}
+
+void sortById(MetaRecords& records) {
+    const auto byId = [](const auto& a, const auto& b) {
+        return storedAuid(a.id) < storedAuid(b.id);
+    };
+    std::sort(records.classes.begin(), records.classes.end(), byId);
+    std::sort(records.types.begin(), records.types.end(), byId);
+    for (MetaClass& entry : records.classes) {
+        std::sort(entry.properties.begin(), entry.properties.end(), byId);
+    }
+}
+
+std::string refusal(const StoredObject& dictionary) {
+    try {
+        readMetaDictionary(dictionary);
+        return "";
+    } catch (const StoredError& problem) {
+        return problem.what();
+    }
+}
+
+StoredProperty& firstType(StoredObject& dictionary, std::uint16_t pid) {
+    for (StoredProperty& property : dictionary.properties[1].objects[0].properties) {
+        if (property.pid == pid) {
+            return property;
+        }
+    }
+    throw std::logic_error("no such property");
+}
+
+}  // namespace
+
+TEST(MetaDictionary, EveryBuiltInDefinitionComesBackFromTheFile) {
+    MetaRecords wanted = sample::builtInRecords();
+    const Bytes file = writeTree(
+        sample::rootWith(sample::reference(1, u"MetaDictionary", storedMetaDictionary(wanted))),
+        SectorSize::Bytes4096);
+    const StoredObject root = readTree(file);
+    MetaRecords read = readMetaDictionary(root.properties.front().objects.front());
+    sortById(wanted);
+    sortById(read);
+
+    ASSERT_EQ(read.classes.size(), wanted.classes.size());
+    for (std::size_t i = 0; i < wanted.classes.size(); ++i) {
+        const MetaClass& a = read.classes[i];
+        const MetaClass& b = wanted.classes[i];
+        EXPECT_EQ(a.id, b.id);
+        EXPECT_EQ(a.name, b.name);
+        EXPECT_EQ(a.parent, b.parent);
+        EXPECT_EQ(a.concrete, b.concrete);
+        ASSERT_EQ(a.properties.size(), b.properties.size());
+        for (std::size_t j = 0; j < b.properties.size(); ++j) {
+            EXPECT_EQ(a.properties[j].id, b.properties[j].id);
+            EXPECT_EQ(a.properties[j].name, b.properties[j].name);
+            EXPECT_EQ(a.properties[j].pid, b.properties[j].pid);
+            EXPECT_EQ(a.properties[j].type, b.properties[j].type);
+            EXPECT_EQ(a.properties[j].optional, b.properties[j].optional);
+            EXPECT_EQ(a.properties[j].unique, b.properties[j].unique);
+        }
+    }
+    ASSERT_EQ(read.types.size(), wanted.types.size());
+    for (std::size_t i = 0; i < wanted.types.size(); ++i) {
+        const MetaType& a = read.types[i];
+        const MetaType& b = wanted.types[i];
+        EXPECT_EQ(a.id, b.id);
+        EXPECT_EQ(a.name, b.name);
+        EXPECT_EQ(a.kind, b.kind);
+        EXPECT_EQ(a.target, b.target);
+        EXPECT_EQ(a.size, b.size);
+        EXPECT_EQ(a.isSigned, b.isSigned);
+        ASSERT_EQ(a.members.size(), b.members.size());
+        for (std::size_t j = 0; j < b.members.size(); ++j) {
+            EXPECT_EQ(a.members[j].name, b.members[j].name);
+            EXPECT_EQ(a.members[j].id, b.members[j].id);
+            EXPECT_EQ(a.members[j].value, b.members[j].value);
+        }
+    }
+}
+
+TEST(MetaDictionary, LaysOutARecordTypeByteForByte) {
+    const Bytes file = writeTree(sample::rootWith(sample::reference(
+                                     1, u"MetaDictionary", storedMetaDictionary(oneType(quad())))),
+                                 SectorSize::Bytes512);
+    CompoundFileReader reader(file);
+    const auto inside = [&](std::uint32_t storage, const char16_t* name) {
+        return reader.entry(storage).contained.at(name);
+    };
+    const std::uint32_t definition =
+        inside(inside(CompoundFileReader::rootIndex, u"MetaDictionary-1"), u"TypeDefinitions-4{0}");
+    EXPECT_EQ(guidOf(reader.entry(definition).classId),
+              ncfGuid("0D010101-020D-0000-060E-2B3402060101"));
+
+    const Bytes head = {0x4C, 0x20, 4,    0, 5,    0,    0x82, 0,    0x10, 0,    6,    0,
+                        0x82, 0,    0x18, 0, 0x1C, 0,    0x12, 0,    0x1E, 0,    0x1D, 0,
+                        0x82, 0,    0x2C, 0, 0x10, 0x1F, 0x2C, 0x9D, 0x5A, 0x4F, 0x77, 0x4C};
+    const Bytes properties = reader.read(inside(definition, u"properties"));
+    ASSERT_EQ(properties.size(), 4u + 24 + 16 + 24 + 30 + 44);
+    EXPECT_TRUE(std::equal(head.begin(), head.end(), properties.begin()));
+
+    Bytes index = {4, 0, 0, 0, 0, 0, 5, 0, 16};
+    for (int i = 0; i < 4; ++i) {
+        const Bytes key = sample::bytes(storedAuid(rationalId));
+        index.insert(index.end(), key.begin(), key.end());
+    }
+    EXPECT_EQ(reader.read(inside(definition, u"MemberTypes-1c index")), index);
+}
+
+TEST(MetaDictionary, IdsAreStoredWithTheirNumbersTurnedRound) {
+    const GUID id = ncfGuid("0D010101-0201-2F00-060E-2B3402060101");
+    const StoredAuid stored = {1, 1, 1, 0x0D, 1, 2, 0, 0x2F, 6, 0x0E, 0x2B, 0x34, 2, 6, 1, 1};
+    EXPECT_EQ(storedAuid(id), stored);
+    EXPECT_EQ(guidOf(stored), id);
+    EXPECT_THROW(guidOf(Bytes(15)), StoredError);
+}
+
+TEST(MetaDictionary, DefinitionsOfAnUnknownKindArePassedOver) {
+    StoredObject dictionary = storedMetaDictionary(oneType(quad()));
+    dictionary.properties[1].objects[0].classId = sample::auid(0x77);
+    EXPECT_TRUE(readMetaDictionary(dictionary).types.empty());
+}
+
+TEST(MetaDictionary, ADefinitionWithoutNameOrIdIsRefused) {
+    StoredObject dictionary = storedMetaDictionary(oneType(quad()));
+    firstType(dictionary, meta::name).pid = 0x7000;
+    EXPECT_EQ(refusal(dictionary), "meta-dictionary: property 0006 is missing");
+    dictionary = storedMetaDictionary(oneType(quad()));
+    firstType(dictionary, meta::identification).bytes.pop_back();
+    EXPECT_EQ(refusal(dictionary), "meta-dictionary: an id of 15 bytes");
+}
+
+TEST(MetaDictionary, NamesAndMembersThatDoNotPairAreRefused) {
+    StoredObject dictionary = storedMetaDictionary(oneType(quad()));
+    firstType(dictionary, meta::recordMemberTypes).keys.pop_back();
+    EXPECT_EQ(refusal(dictionary), "meta-dictionary: 4 names for 3 members");
+    dictionary = storedMetaDictionary(oneType(quad()));
+    Bytes& names = firstType(dictionary, meta::recordMemberNames).bytes;
+    names.resize(names.size() - 2);
+    EXPECT_EQ(refusal(dictionary), "meta-dictionary: property 001d ends within a name");
+}
+
+TEST(MetaDictionary, AValueOfTheWrongSizeIsRefused) {
+    MetaType type;
+    type.id = quadId;
+    type.name = u"Odd";
+    type.kind = TypeKind::FixedArray;
+    type.size = 3;
+    StoredObject dictionary = storedMetaDictionary(oneType(type));
+    firstType(dictionary, meta::fixedArrayCount).bytes.pop_back();
+    EXPECT_EQ(refusal(dictionary), "meta-dictionary: 4 bytes wanted, 3 left");
+}
+
+TEST(MetaDictionary, WithoutItsSetsItIsRefused) {
+    EXPECT_EQ(refusal(StoredObject()), "meta-dictionary: property 0003 is missing");
+}
