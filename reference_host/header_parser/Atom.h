@@ -1,0 +1,46 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "reference_host/header_parser/ByteReader.h"
+
+namespace header_parser {
+
+// An atom within the header: its type and the bytes behind its own header.
+struct Atom {
+    ncfUInt32 type = 0;
+    const ncfUInt8* begin = nullptr;
+    const ncfUInt8* end = nullptr;
+
+    ncfUInt64 Size() const { return static_cast<ncfUInt64>(end - begin); }
+    explicit operator bool() const { return begin != nullptr; }
+};
+
+// Walks the atoms that fill a range. Each is given its own sub-range, so a
+// child cannot read its neighbour.
+//
+// The list ends at the end of the range or at four zero bytes that close it,
+// as user data and sample descriptions do. What is neither makes it broken:
+// Next then answers false, and Broken tells why it stopped.
+class AtomList {
+public:
+    AtomList(const ncfUInt8* begin, const ncfUInt8* end) : reader_(begin, end) {}
+    explicit AtomList(const Atom& parent) : AtomList(parent.begin, parent.end) {}
+
+    bool Next(Atom& atom);
+    bool Broken() const { return broken_; }
+    // Stopped at a zero where an atom could have stood.
+    bool Closed() const { return closed_; }
+
+private:
+    bool Stop(bool broken);
+
+    ByteReader reader_;
+    bool broken_ = false;
+    bool closed_ = false;
+};
+
+// The first child of that type, or an empty atom.
+Atom FindAtom(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt32 type);
+
+}  // namespace header_parser

@@ -1,0 +1,169 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/header_parser/ChunkMap.h"
+
+#include <algorithm>
+#include <limits>
+
+namespace header_parser {
+
+namespace {
+
+constexpr ncfUInt32 kStep = 16;
+constexpr ncfUInt64 kMaxPosition = static_cast<ncfUInt64>(std::numeric_limits<ncfSInt64>::max());
+
+unsigned LowestBit(ncfUInt64 bits) {
+    unsigned place = 0;
+    for (unsigned width = 32; width != 0; width /= 2) {
+        if ((bits & ((ncfUInt64{1} << width) - 1)) == 0) {
+            bits >>= width;
+            place += width;
+        }
+    }
+    return place;
+}
+
+}  // namespace
+
+Verdict ChunkMap::Read(const Atom& stsc, const Atom& stco, const Atom& co64,
+                       const SampleSizes& sizes, const std::vector<bool>& isInFile) {
+    sampleCount_ = sizes.Count();
+    if (sampleCount_ == 0) {
+        return Fine();
+    }
+    Verdict verdict = OpenPositions(stco, co64);
+    if (!verdict.Refused()) {
+        verdict = ReadRuns(stsc, static_cast<ncfUInt32>(isInFile.size()));
+    }
+    return verdict.Refused() ? verdict : WalkChunks(sizes, isInFile);
+}
+
+Verdict ChunkMap::OpenPositions(const Atom& stco, const Atom& co64) {
+    if (!stco && !co64) {
+        return Broken("the track has no chunk offsets");
+    }
+    isLarge_ = !stco;
+    const Atom& atom = isLarge_ ? co64 : stco;
+    ByteReader reader(atom.begin, atom.end);
+    reader.Skip(4);
+    chunkCount_ = reader.U32();
+    positions_ = reader.At();
+    if (reader.Failed() || chunkCount_ > reader.Left() / (isLarge_ ? 8 : 4)) {
+        return Broken("the chunk offset table claims more entries than it holds");
+    }
+    return chunkCount_ > 0 ? Fine() : Broken("the track has samples but no chunks");
+}
+
+Verdict ChunkMap::ReadRuns(const Atom& stsc, ncfUInt32 descriptions) {
+    ByteReader reader(stsc.begin, stsc.end);
+    reader.Skip(4);
+    runCount_ = reader.U32();
+    runs_ = reader.At();
+    if (reader.Failed() || runCount_ == 0 || runCount_ > reader.Left() / 12) {
+        return Broken("stsc claims more entries than it holds");
+    }
+    if (Field(0, 0) != 1) {
+        return Broken("stsc does not begin with the first chunk");
+    }
+    marks_.reserve(runCount_ / kStep + 1);
+    ncfUInt64 sample = 0;
+    for (ncfUInt32 run = 0; run < runCount_; ++run) {
+        if (run % kStep == 0) {
+            marks_.push_back(static_cast<ncfUInt32>(sample));
+        }
+        if (FirstChunk(run) >= EndChunk(run) || EndChunk(run) > chunkCount_) {
+            return Broken("stsc names chunks that the movie lacks");
+        }
+        if (SamplesPerChunk(run) == 0 || Description(run) == 0 || Description(run) > descriptions) {
+            return Broken("stsc holds an impossible entry");
+        }
+        // The last chunk may be filled in part.
+        const ncfUInt64 chunks = EndChunk(run) - FirstChunk(run);
+        const bool isLast = run + 1 == runCount_;
+        const ncfUInt64 needed =
+            sample + (chunks - (isLast ? 1 : 0)) * SamplesPerChunk(run) + (isLast ? 1 : 0);
+        if (needed > sampleCount_) {
+            return Broken("stsc places more samples than there are");
+        }
+        sample += chunks * SamplesPerChunk(run);
+    }
+    return sample >= sampleCount_ ? Fine() : Broken("stsc places fewer samples than there are");
+}
+
+Verdict ChunkMap::WalkChunks(const SampleSizes& sizes, const std::vector<bool>& isInFile) {
+    breaks_.assign(chunkCount_ / 64 + 1, 0);
+    ncfUInt32 sample = 0;
+    ncfUInt64 end = 0;
+    ncfUInt32 lastDescription = 0;
+    for (ncfUInt32 run = 0; run < runCount_; ++run) {
+        const ncfUInt32 description = Description(run);
+        for (ncfUInt32 chunk = FirstChunk(run); chunk < EndChunk(run); ++chunk) {
+            const ncfUInt32 count = std::min(SamplesPerChunk(run), sampleCount_ - sample);
+            const ncfUInt64 position = PositionOf(chunk);
+            const ncfUInt64 size = sizes.BytesOf(sample, count);
+            if (position > kMaxPosition || size > kMaxPosition - position) {
+                return Broken("a chunk lies beyond any file");
+            }
+            // No media can stand where the first atom has its header; this is
+            // also what a table looks like behind the end of a cut file.
+            if (position < 8 && size > 0 && isInFile[description - 1]) {
+                return Broken("a chunk has no place in the file");
+            }
+            if (position != end || description != lastDescription) {
+                breaks_[chunk / 64] |= ncfUInt64{1} << chunk % 64;
+            }
+            end = position + size;
+            lastDescription = description;
+            sample += count;
+        }
+    }
+    return Fine();
+}
+
+ChunkMap::Place ChunkMap::PlaceIn(ncfUInt32 run, ncfUInt32 firstSampleOfRun,
+                                  ncfUInt32 chunkInRun) const {
+    const ncfUInt32 perChunk = SamplesPerChunk(run);
+    const ncfUInt32 first = firstSampleOfRun + chunkInRun * perChunk;
+    return {FirstChunk(run) + chunkInRun, first, std::min(perChunk, sampleCount_ - first),
+            Description(run)};
+}
+
+ChunkMap::Place ChunkMap::PlaceOfSample(ncfUInt32 sample) const {
+    const auto mark = std::upper_bound(marks_.begin(), marks_.end(), sample) - 1;
+    auto run = static_cast<ncfUInt32>(mark - marks_.begin()) * kStep;
+    ncfUInt32 first = *mark;
+    for (;; ++run) {
+        const ncfUInt64 held = ncfUInt64{EndChunk(run) - FirstChunk(run)} * SamplesPerChunk(run);
+        if (sample - first < held) {
+            return PlaceIn(run, first, (sample - first) / SamplesPerChunk(run));
+        }
+        first += static_cast<ncfUInt32>(held);
+    }
+}
+
+ChunkMap::Place ChunkMap::PlaceOfChunk(ncfUInt32 chunk) const {
+    ncfUInt32 low = 0;
+    ncfUInt32 high = runCount_;
+    while (high - low > 1) {
+        const ncfUInt32 middle = low + (high - low) / 2;
+        (FirstChunk(middle) <= chunk ? low : high) = middle;
+    }
+    ncfUInt32 run = low / kStep * kStep;
+    ncfUInt32 first = marks_[low / kStep];
+    for (; run < low; ++run) {
+        first += (EndChunk(run) - FirstChunk(run)) * SamplesPerChunk(run);
+    }
+    return PlaceIn(low, first, chunk - FirstChunk(low));
+}
+
+ncfUInt32 ChunkMap::NextBreak(ncfUInt32 chunk) const {
+    ++chunk;
+    ncfUInt32 word = chunk / 64;
+    ncfUInt64 bits = chunk < chunkCount_ ? breaks_[word] >> chunk % 64 << chunk % 64 : 0;
+    while (bits == 0 && (word + 1) * ncfUInt64{64} < chunkCount_) {
+        bits = breaks_[++word];
+    }
+    return bits == 0 ? chunkCount_ : word * 64 + LowestBit(bits);
+}
+
+}  // namespace header_parser

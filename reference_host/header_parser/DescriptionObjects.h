@@ -1,0 +1,74 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <memory>
+
+#include "host_interfaces/header_parser/SampleDescription.h"
+#include "reference_host/framework/Component.h"
+#include "reference_host/header_parser/SoundDescription.h"
+#include "reference_host/header_parser/VideoDescription.h"
+
+namespace header_parser {
+
+class VideoDescriptionObject final : public host::Component<IVideoSampleDescription> {
+public:
+    explicit VideoDescriptionObject(std::shared_ptr<const VideoDescription> description)
+        : description_(std::move(description)) {}
+
+    NCFRESULT GetDataFormat(ncfUInt32* dataFormat) override;
+    NCFRESULT GetEncodedWidthAndHeight(ncfUInt16* width, ncfUInt16* height) override;
+    NCFRESULT HasAlpha(ncfSInt32* hasAlpha) override;
+    NCFRESULT GetFieldInfo(ncfUInt32* fieldCount, ncfUInt32* topFieldFirst,
+                           ncfUInt32* split) override;
+    NCFRESULT GetVendor(ncfUInt32* vendor) override;
+    NCFRESULT GetImageAspectRatio(ncfUInt32* numerator, ncfUInt32* denominator) override;
+    NCFRESULT GetVideoColorSpaceDetails(ncfUInt32* codes) override;
+    NCFRESULT GetNivoAlphaCodingCount(ncfUInt32* count) override;
+    NCFRESULT GetNivoAlphaCoding(ncfUInt32 index, ncfUInt32* coding) override;
+    NCFRESULT GetNivoResolution(QTNivoResolution* resolution) override;
+    NCFRESULT GetRIAttributes(INCFString** text) override;
+    NCFRESULT GetCMAttributes(INCFString** text) override;
+
+    NCFRESULT ReservedVideoDescription4() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription6() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription7() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription8() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription9() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription11() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription13() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription14() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription15() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription16() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription17() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription21() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription22() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription23() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription27() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedVideoDescription28() override { return NCF_E_NOTIMPL; }
+
+private:
+    std::shared_ptr<const VideoDescription> description_;
+};
+
+class AudioDescriptionObject final : public host::Component<IAudioSampleDescription> {
+public:
+    explicit AudioDescriptionObject(std::shared_ptr<const SoundDescription> description)
+        : description_(std::move(description)) {}
+
+    NCFRESULT GetChannelsPerFrame(ncfUInt32* channels) override;
+    NCFRESULT GetBitsPerChannel(ncfUInt32* bits) override;
+    NCFRESULT GetSampleRate(double* rate) override;
+    NCFRESULT IsConstantBitRate(ncfBool* constant) override;
+    NCFRESULT IsLPCM(ncfBool* isLPCM) override;
+    NCFRESULT GetBytesPerPacket(ncfUInt32* bytes) override;
+    NCFRESULT IsLittleEndian(ncfBool* littleEndian) override;
+
+    NCFRESULT ReservedAudioDescription3() override { return NCF_E_NOTIMPL; }
+    NCFRESULT ReservedAudioDescription4() override { return NCF_E_NOTIMPL; }
+
+private:
+    std::shared_ptr<const SoundDescription> description_;
+};
+
+}  // namespace header_parser

@@ -1,0 +1,217 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/header_parser/HeaderScanner.h"
+
+#include <algorithm>
+#include <iterator>
+#include <limits>
+
+#include "reference_host/header_parser/ByteReader.h"
+
+namespace header_parser {
+
+namespace {
+
+constexpr ncfUInt64 kMaxPosition = static_cast<ncfUInt64>(std::numeric_limits<ncfSInt64>::max());
+
+// What may open a file of this family. Behind that, other types are passed
+// over as long as they are text.
+constexpr ncfUInt32 kOpeningAtoms[] = {
+    Code("ftyp"), Code("moov"), Code("mdat"), Code("free"), Code("skip"),
+    Code("wide"), Code("pnot"), Code("PICT"), Code("uuid"), Code("udta"),
+    Code("meta"), Code("junk"), Code("prfl"), Code("pdin"),
+};
+
+bool MayOpenAFile(ncfUInt32 type) {
+    return std::find(std::begin(kOpeningAtoms), std::end(kOpeningAtoms), type) !=
+           std::end(kOpeningAtoms);
+}
+
+bool IsText(ncfUInt32 type) {
+    for (int shift = 24; shift >= 0; shift -= 8) {
+        const ncfUInt32 c = type >> shift & 0xFF;
+        if (!(c >= 0x20 && c < 0x7F) && c != 0xA9) {
+            return false;
+        }
+    }
+    return true;
+}
+
+bool BelongsToFragments(ncfUInt32 type) {
+    return type == Code("moof") || type == Code("styp") || type == Code("sidx") ||
+           type == Code("mfra");
+}
+
+}  // namespace
+
+// What of a fed range lies behind the cursor.
+struct HeaderScanner::Range {
+    const ncfUInt8* at;
+    const ncfUInt8* end;
+
+    ncfUInt64 Left() const { return static_cast<ncfUInt64>(end - at); }
+};
+
+Verdict HeaderScanner::Want(ncfUInt64 position, ncfUInt64 size) {
+    isWaiting_ = true;
+    wantedPosition_ = position;
+    wantedSize_ = static_cast<ncfUInt32>(std::min<ncfUInt64>(size, limits_.maxReadSize));
+    return Fine();
+}
+
+Verdict HeaderScanner::Feed(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position,
+                            Progress& progress) {
+    progress = Progress::kMore;
+    const auto size = static_cast<ncfUInt64>(end - begin);
+    const ncfUInt64 needed = state_ == State::kConfirm ? wantedPosition_ : cursor_;
+    const bool isShort = isWaiting_ && position + size < wantedPosition_ + wantedSize_;
+    if (position > needed || size <= needed - position || isShort) {
+        return {NCF_E_INVALIDARG, "the bytes given are not those asked for"};
+    }
+    isWaiting_ = false;
+    Range range{begin + (needed - position), end};
+    while (!isWaiting_ && state_ != State::kWhole) {
+        Verdict verdict;
+        switch (state_) {
+            case State::kWalk:
+                verdict = Walk(range);
+                break;
+            case State::kGather:
+                verdict = Gather(range);
+                break;
+            case State::kGatherToEnd:
+                verdict = GatherToEnd(range);
+                break;
+            case State::kConfirm:
+                state_ = State::kWhole;
+                break;
+            case State::kWhole:
+                break;
+        }
+        if (verdict.Refused()) {
+            return verdict;
+        }
+    }
+    if (state_ == State::kWhole) {
+        progress = Progress::kWhole;
+    }
+    return Fine();
+}
+
+Verdict HeaderScanner::Walk(Range& range) {
+    if (range.Left() < 8) {
+        return Want(cursor_, limits_.scanReadSize);
+    }
+    const ncfUInt32 shortSize = LoadU32(range.at);
+    const ncfUInt32 type = LoadU32(range.at + 4);
+    if (shortSize == 0 && type == 0) {
+        return NoData("the file ends without a movie header");
+    }
+    if (shortSize == 1 && range.Left() < 16) {
+        return Want(cursor_, limits_.scanReadSize);
+    }
+    const ncfUInt64 headerSize = shortSize == 1 ? 16 : 8;
+    const ncfUInt64 size = shortSize == 1 ? LoadU64(range.at + 8) : shortSize;
+    if (atomsSeen_ == 0 ? !MayOpenAFile(type) && !BelongsToFragments(type) : !IsText(type)) {
+        return NotSupported("not a file of the QuickTime family");
+    }
+    if (BelongsToFragments(type)) {
+        return NotSupported("the movie is fragmented");
+    }
+    if (++atomsSeen_ > limits_.maxTopLevelAtoms) {
+        return TooMuch("too many atoms in front of the movie header");
+    }
+    if (shortSize != 0 && (size < headerSize || size > kMaxPosition - cursor_)) {
+        return Broken("an atom's size is impossible");
+    }
+    if (type == Code("moov")) {
+        range.at += headerSize;
+        return EnterHeader(size, headerSize, shortSize == 0);
+    }
+    if (shortSize == 0) {
+        return NoData("an atom that reaches to the end stands where the movie header should");
+    }
+    cursor_ += size;
+    if (size >= range.Left()) {
+        return Want(cursor_, limits_.scanReadSize);
+    }
+    range.at += size;
+    return Fine();
+}
+
+Verdict HeaderScanner::EnterHeader(ncfUInt64 size, ncfUInt64 headerSize, bool toEnd) {
+    atomPosition_ = cursor_;
+    atomSize_ = size;
+    atomHeaderSize_ = headerSize;
+    cursor_ += headerSize;
+    state_ = toEnd ? State::kGatherToEnd : State::kGather;
+    if (!toEnd && size > limits_.maxHeaderBytes) {
+        return TooMuch("the movie header is too large");
+    }
+    return Fine();
+}
+
+Verdict HeaderScanner::Gather(Range& range) {
+    const ncfUInt64 missing = atomSize_ - atomHeaderSize_ - payload_.Size();
+    const ncfUInt64 taken = std::min(missing, range.Left());
+    if (!payload_.Append(range.at, taken)) {
+        return TooMuch("no memory for the movie header");
+    }
+    range.at += taken;
+    cursor_ += taken;
+    return taken == missing ? Finish() : Want(cursor_, missing - taken);
+}
+
+// The atom's size is 0: it ends with the last child in front of the zeros
+// that stand behind the end of the file.
+Verdict HeaderScanner::GatherToEnd(Range& range) {
+    const ncfUInt64 taken = range.Left();
+    if (payload_.Size() + taken > limits_.maxHeaderBytes) {
+        return TooMuch("the movie header is too large");
+    }
+    if (!payload_.Append(range.at, taken)) {
+        return TooMuch("no memory for the movie header");
+    }
+    range.at += taken;
+    cursor_ += taken;
+    ncfUInt64 childSize = 0;
+    while (payload_.Size() - walked_ >= 8) {
+        const ncfUInt8* child = payload_.begin() + walked_;
+        const ncfUInt32 shortSize = LoadU32(child);
+        if (shortSize == 0) {
+            payload_.Shorten(walked_);
+            atomSize_ = atomHeaderSize_ + walked_;
+            cursor_ = atomPosition_ + atomSize_;
+            return Finish();
+        }
+        if (shortSize == 1 && payload_.Size() - walked_ < 16) {
+            break;
+        }
+        childSize = shortSize == 1 ? LoadU64(child + 8) : shortSize;
+        if (childSize < 8 || childSize > limits_.maxHeaderBytes) {
+            return Broken("an atom of the movie header has an impossible size");
+        }
+        if (childSize > payload_.Size() - walked_) {
+            break;
+        }
+        walked_ += childSize;
+        childSize = 0;
+    }
+    // One byte that is there already goes along, so that the read does not
+    // fail when the file ends exactly here.
+    const ncfUInt64 known = payload_.Size() - walked_;
+    const ncfUInt64 missing = childSize > known ? childSize - known : 0;
+    return Want(cursor_ - 1, std::max<ncfUInt64>(missing + 1, limits_.scanReadSize));
+}
+
+Verdict HeaderScanner::Finish() {
+    const bool isCertain = payload_.Size() == 0 || payload_.end()[-1] != 0;
+    if (isCertain) {
+        state_ = State::kWhole;
+        return Fine();
+    }
+    state_ = State::kConfirm;
+    return Want(atomPosition_ + atomSize_ - 1, 1);
+}
+
+}  // namespace header_parser

@@ -1,0 +1,128 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/header_parser/Movie.h"
+
+#include <algorithm>
+#include <limits>
+
+namespace header_parser {
+
+namespace {
+
+constexpr ncfUInt64 kMax32 = std::numeric_limits<ncfUInt32>::max();
+
+struct MovieHeader {
+    bool isPresent = false;
+    std::optional<ncfUInt64> duration;
+};
+
+Verdict ReadMovieHeader(const Atom& mvhd, Movie& movie, MovieHeader& header) {
+    ByteReader reader(mvhd.begin, mvhd.end);
+    const unsigned version = reader.U8();
+    reader.Skip(3);
+    ncfUInt64 duration = 0;
+    if (version == 1) {
+        movie.creationTime = reader.U64();
+        reader.Skip(8);
+        movie.timeScale = reader.U32();
+        duration = reader.U64();
+    } else {
+        movie.creationTime = reader.U32();
+        reader.Skip(4);
+        movie.timeScale = reader.U32();
+        duration = reader.U32();
+    }
+    if (reader.Failed() || version > 1) {
+        return Broken("mvhd is cut short or of an unknown version");
+    }
+    if (movie.timeScale == 0) {
+        return Broken("the movie has no time scale");
+    }
+    const ncfUInt64 unknown = version == 1 ? std::numeric_limits<ncfUInt64>::max() : kMax32;
+    if (duration != 0 && duration != unknown) {
+        header.duration = duration;
+    }
+    header.isPresent = true;
+    return Fine();
+}
+
+// The tracks need the movie's time scale, and mvhd need not stand first.
+struct HeaderParts {
+    MovieHeader header;
+    std::vector<Atom> tracks;
+};
+
+Verdict SortParts(const ParserLimits& limits, Movie& movie, HeaderParts& parts) {
+    AtomList atoms(movie.bytes.begin(), movie.bytes.end());
+    Atom atom;
+    while (atoms.Next(atom)) {
+        Verdict verdict;
+        if (atom.type == Code("mvhd") && !parts.header.isPresent) {
+            verdict = ReadMovieHeader(atom, movie, parts.header);
+        } else if (atom.type == Code("trak")) {
+            parts.tracks.push_back(atom);
+        } else if (atom.type == Code("mvex")) {
+            verdict = NotSupported("the movie is fragmented");
+        } else if (atom.type == Code("rmra")) {
+            verdict = NotSupported("the movie only refers to others");
+        }
+        if (verdict.Refused()) {
+            return verdict;
+        }
+        if (parts.tracks.size() > limits.maxTracks) {
+            return TooMuch("too many tracks");
+        }
+    }
+    // Zeros among the tracks are what a header looks like behind the end of a
+    // cut file.
+    if (atoms.Broken() || atoms.Closed()) {
+        return Broken("the movie header is not a list of atoms");
+    }
+    return parts.header.isPresent ? Fine() : Broken("the movie has no mvhd");
+}
+
+Verdict SetDuration(const MovieHeader& header, Movie& movie) {
+    if (header.duration && *header.duration > kMax32) {
+        return NotSupported("the movie's duration does not fit 32 bits");
+    }
+    movie.duration = static_cast<ncfUInt32>(header.duration.value_or(0));
+    if (!header.duration) {
+        for (const Track& track : movie.tracks) {
+            movie.duration = std::max(movie.duration, track.duration);
+        }
+    }
+    return Fine();
+}
+
+}  // namespace
+
+bool Movie::IsSelfContained() const {
+    return std::all_of(tracks.begin(), tracks.end(), [](const Track& track) {
+        return std::find(track.isInFile.begin(), track.isInFile.end(), false) ==
+               track.isInFile.end();
+    });
+}
+
+Verdict ReadMovie(HeaderBytes&& bytes, const ParserLimits& limits, Movie& movie) {
+    movie.bytes = std::move(bytes);
+    Verdict verdict = Inflate(movie.bytes, limits);
+    HeaderParts parts;
+    if (!verdict.Refused()) {
+        verdict = SortParts(limits, movie, parts);
+    }
+    if (verdict.Refused()) {
+        return verdict;
+    }
+    for (const Atom& trak : parts.tracks) {
+        movie.tracks.emplace_back();
+        verdict = ReadTrack(trak, movie.timeScale, limits, movie.tracks.back());
+        if (verdict.Refused()) {
+            return verdict;
+        }
+        movie.ofKind[static_cast<std::size_t>(movie.tracks.back().kind)].push_back(
+            static_cast<ncfUInt32>(movie.tracks.size() - 1));
+    }
+    return SetDuration(parts.header, movie);
+}
+
+}  // namespace header_parser

@@ -1,0 +1,254 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/header_parser/QTParser.h"
+
+#include <algorithm>
+
+#include "reference_host/framework/Guard.h"
+#include "reference_host/header_parser/TrackObjects.h"
+
+namespace header_parser {
+
+QTParser::QTParser(const ParserLimits& limits) : limits_(limits), scanner_(limits) {}
+
+NCFRESULT QTParser::ParseHeaders(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position) {
+    if (begin == nullptr || end == nullptr) {
+        return NCF_E_POINTER;
+    }
+    if (end < begin) {
+        return NCF_E_INVALIDARG;
+    }
+    isWaiting_ = false;
+    const NCFRESULT result = host::Guarded([&] {
+        switch (state_) {
+            case State::kHeader:
+                return ReadHeader(begin, end, position);
+            case State::kTimecode:
+                return ReadTimecode(begin, end, position);
+            case State::kDone:
+                return NCF_OK;
+            case State::kRefused:
+                break;
+        }
+        return refusal_.code;
+    });
+    if (result == NCF_E_OUTOFMEMORY && state_ != State::kRefused) {
+        return Refuse(TooMuch("no memory for the movie header"));
+    }
+    return result;
+}
+
+NCFRESULT QTParser::Refuse(const Verdict& verdict) {
+    refusal_ = verdict;
+    state_ = State::kRefused;
+    movie_.reset();
+    return verdict.code;
+}
+
+NCFRESULT QTParser::ReadHeader(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position) {
+    HeaderScanner::Progress progress{};
+    Verdict verdict = scanner_.Feed(begin, end, position, progress);
+    if (verdict.Refused()) {
+        return Refuse(verdict);
+    }
+    if (progress == HeaderScanner::Progress::kMore) {
+        isWaiting_ = true;
+        wantedPosition_ = scanner_.WantedPosition();
+        wantedSize_ = scanner_.WantedSize();
+        return QT_E_MOREDATA;
+    }
+    auto movie = std::make_shared<Movie>();
+    verdict = ReadMovie(std::move(scanner_.Payload()), limits_, *movie);
+    if (verdict.Refused()) {
+        return Refuse(verdict);
+    }
+    movie->atomPosition = scanner_.AtomPosition();
+    movie->atomSize = scanner_.AtomSize();
+    movie_ = std::move(movie);
+    if (TimecodeTrack() == nullptr) {
+        state_ = State::kDone;
+        return NCF_OK;
+    }
+    state_ = State::kTimecode;
+    return ReadTimecode(begin, end, position);
+}
+
+const Track* QTParser::TimecodeTrack() const {
+    const std::vector<ncfUInt32>& tracks = movie_->Of(TrackKind::kTimecode);
+    if (tracks.empty()) {
+        return nullptr;
+    }
+    const Track& track = movie_->tracks[tracks.front()];
+    const bool isReadable = track.timecode.IsUsable() && track.samples.Count() > 0 &&
+                            track.samples.Sizes().SizeOf(0) >= 4 && track.isInFile.front();
+    return isReadable ? &track : nullptr;
+}
+
+// The sample may lie in the bytes that were just given. When it is all zeros
+// there it may as well be padding behind the end of the file, so it is then
+// asked for by itself.
+NCFRESULT QTParser::ReadTimecode(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position) {
+    constexpr ncfUInt64 kSize = 4;
+    const Track& track = *TimecodeTrack();
+    const ncfUInt64 place = track.samples.PositionOf(0);
+    const auto given = static_cast<ncfUInt64>(end - begin);
+    const bool isThere = place >= position && given >= kSize && place - position <= given - kSize;
+    const ncfUInt8* sample = isThere ? begin + (place - position) : nullptr;
+    const bool wasAskedFor = wantedPosition_ == place && wantedSize_ == kSize;
+    if (isThere && (wasAskedFor || LoadU32(sample) != 0)) {
+        movie_->startAddress = ReadTimecodeSample(sample, track.timecode);
+        state_ = State::kDone;
+        return NCF_OK;
+    }
+    if (wasAskedFor) {
+        return Refuse({NCF_E_INVALIDARG, "the bytes given are not those asked for"});
+    }
+    isWaiting_ = true;
+    wantedPosition_ = place;
+    wantedSize_ = kSize;
+    return QT_E_MOREDATA;
+}
+
+NCFRESULT QTParser::GetRecomendedReadPosition(ncfUInt64* position, ncfUInt32* size) {
+    if (position == nullptr || size == nullptr) {
+        return NCF_E_POINTER;
+    }
+    if (!isWaiting_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    *position = wantedPosition_;
+    *size = wantedSize_;
+    return NCF_OK;
+}
+
+template <typename Value>
+NCFRESULT QTParser::Give(Value value, Value* out) const {
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    *out = value;
+    return NCF_OK;
+}
+
+NCFRESULT QTParser::GetCreationTime(ncfUInt64* seconds) {
+    return state_ == State::kDone ? Give(movie_->creationTime, seconds) : NMA_E_NOTINITIALIZED;
+}
+
+NCFRESULT QTParser::GetTimeScale(ncfUInt32* timescale) {
+    return state_ == State::kDone ? Give(movie_->timeScale, timescale) : NMA_E_NOTINITIALIZED;
+}
+
+NCFRESULT QTParser::GetMovieDuration(ncfUInt32* duration) {
+    return state_ == State::kDone ? Give(movie_->duration, duration) : NMA_E_NOTINITIALIZED;
+}
+
+NCFRESULT QTParser::GiveCount(TrackKind kind, ncfUInt32* count) const {
+    if (state_ != State::kDone) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    return Give(static_cast<ncfUInt32>(movie_->Of(kind).size()), count);
+}
+
+NCFRESULT QTParser::GetVideoTrackCount(ncfUInt32* count) {
+    return GiveCount(TrackKind::kVideo, count);
+}
+
+NCFRESULT QTParser::GetAudioTrackCount(ncfUInt32* count) {
+    return GiveCount(TrackKind::kSound, count);
+}
+
+NCFRESULT QTParser::GetTimeCodeTrackCount(ncfUInt32* count) {
+    return GiveCount(TrackKind::kTimecode, count);
+}
+
+NCFRESULT QTParser::GetOtherTrackCount(ncfUInt32* count) {
+    return GiveCount(TrackKind::kOther, count);
+}
+
+template <class Object, class Interface>
+NCFRESULT QTParser::GiveTrack(TrackKind kind, ncfUInt32 index, Interface** out) const {
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    *out = nullptr;
+    if (state_ != State::kDone) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    if (index >= movie_->Of(kind).size()) {
+        return NCF_E_NOTFOUND;
+    }
+    return host::Guarded([&] {
+        const Track& track = movie_->tracks[movie_->Of(kind)[index]];
+        *out = host::MakeRef<Object>(Shared<Track>(movie_, &track), movie_->timeScale).Detach();
+        return NCF_OK;
+    });
+}
+
+NCFRESULT QTParser::GetVideoTrackInfo(ncfUInt32 index, IVideoTrackInfo** track) {
+    return GiveTrack<VideoTrackObject>(TrackKind::kVideo, index, track);
+}
+
+NCFRESULT QTParser::GetAudioTrackInfo(ncfUInt32 index, IAudioTrackInfo** track) {
+    return GiveTrack<AudioTrackObject>(TrackKind::kSound, index, track);
+}
+
+NCFRESULT QTParser::GetTimeCodeTrackInfo(ncfUInt32 index, ITrackInfo** track) {
+    return GiveTrack<PlainTrackObject>(TrackKind::kTimecode, index, track);
+}
+
+NCFRESULT QTParser::GetOtherTrackInfo(ncfUInt32 index, ITrackInfo** track) {
+    return GiveTrack<PlainTrackObject>(TrackKind::kOther, index, track);
+}
+
+NCFRESULT QTParser::GetTimeCodeInfo(ncfUInt8* hours, ncfUInt8* minutes, ncfUInt8* seconds,
+                                    ncfUInt8* frames, ncfUInt32* timeScale,
+                                    ncfUInt32* frameDuration, ncfUInt32* drop,
+                                    ncfUInt32* numFrames) {
+    if (hours == nullptr || minutes == nullptr || seconds == nullptr || frames == nullptr ||
+        timeScale == nullptr || frameDuration == nullptr || drop == nullptr ||
+        numFrames == nullptr) {
+        return NCF_E_POINTER;
+    }
+    if (state_ != State::kDone) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    if (!movie_->startAddress) {
+        return movie_->Of(TrackKind::kTimecode).empty() ? NCF_E_NOTFOUND
+                                                        : NCF_E_PARAMETERNOTAVAILABLE;
+    }
+    const TimecodeDescription& description = TimecodeTrack()->timecode;
+    *hours = movie_->startAddress->hours;
+    *minutes = movie_->startAddress->minutes;
+    *seconds = movie_->startAddress->seconds;
+    *frames = movie_->startAddress->frames;
+    *timeScale = description.timeScale;
+    *frameDuration = description.frameDuration;
+    *drop = description.IsDropFrame() ? 1 : 0;
+    *numFrames = description.numFrames;
+    return NCF_OK;
+}
+
+NCFRESULT QTParser::IsMovieSelfContained(ncfBool* selfContained) {
+    if (state_ != State::kDone) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    return Give<ncfBool>(movie_->IsSelfContained() ? 1 : 0, selfContained);
+}
+
+NCFRESULT QTParser::GetMOOVAtom(ncfUInt64* position, ncfUInt64* size) {
+    if (position == nullptr || size == nullptr) {
+        return NCF_E_POINTER;
+    }
+    if (state_ != State::kDone) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    *position = movie_->atomPosition;
+    *size = movie_->atomSize;
+    return NCF_OK;
+}
+
+host::Maker QTParserMaker(const ParserLimits& limits) {
+    return host::MakerOf([limits](INCFUnknown*) { return host::MakeRef<QTParser>(limits); });
+}
+
+}  // namespace header_parser

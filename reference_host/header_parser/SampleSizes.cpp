@@ -1,0 +1,131 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/header_parser/SampleSizes.h"
+
+#include <algorithm>
+#include <limits>
+
+namespace header_parser {
+
+namespace {
+constexpr ncfUInt32 kStep = 64;  // samples between two marks: 8 bytes for 256 of the table
+}
+
+Verdict SampleSizes::Read(const Atom& stsz, const Atom& stz2) {
+    if (!stsz && !stz2) {
+        return Broken("the track has no sample sizes");
+    }
+    const Atom& atom = stsz ? stsz : stz2;
+    ByteReader reader(atom.begin, atom.end);
+    reader.Skip(4);
+    const ncfUInt32 parameter = reader.U32();
+    count_ = reader.U32();
+    if (reader.Failed()) {
+        return Broken("the sample size table is cut short");
+    }
+    entries_ = reader.At();
+    entryBits_ = 32;
+    if (stsz) {
+        fixed_ = parameter;
+    } else {
+        entryBits_ = parameter & 0xFF;
+        if (entryBits_ != 4 && entryBits_ != 8 && entryBits_ != 16) {
+            return Broken("stz2 has an impossible field size");
+        }
+    }
+    if (fixed_ != 0) {
+        smallest_ = largest_ = fixed_;
+        return Fine();
+    }
+    if ((ncfUInt64{count_} * entryBits_ + 7) / 8 > reader.Left()) {
+        return Broken("the sample size table claims more entries than it holds");
+    }
+    Mark();
+    return Fine();
+}
+
+void SampleSizes::Mark() {
+    marks_.reserve(count_ / kStep + 1);
+    ncfUInt64 sum = 0;
+    smallest_ = count_ == 0 ? 0 : std::numeric_limits<ncfUInt32>::max();
+    for (ncfUInt32 start = 0; start < count_; start += std::min(kStep, count_ - start)) {
+        marks_.push_back(sum);
+        const ncfUInt32 end = start + std::min(kStep, count_ - start);
+        for (ncfUInt32 sample = start; sample < end; ++sample) {
+            const ncfUInt32 size = Entry(sample);
+            sum += size;
+            smallest_ = std::min(smallest_, size);
+            largest_ = std::max(largest_, size);
+        }
+    }
+}
+
+void SampleSizes::UsePackets(const PacketLayout& layout) {
+    packets_ = layout;
+    smallest_ = largest_ = layout.bytesPerPacket;
+}
+
+ncfUInt32 SampleSizes::Entry(ncfUInt32 sample) const {
+    switch (entryBits_) {
+        case 4:
+            return sample % 2 == 0 ? entries_[sample / 2] >> 4 : entries_[sample / 2] & 0xF;
+        case 8:
+            return entries_[sample];
+        case 16:
+            return LoadU16(entries_ + ncfUInt64{2} * sample);
+        default:
+            return LoadU32(entries_ + ncfUInt64{4} * sample);
+    }
+}
+
+ncfUInt64 SampleSizes::Sum(ncfUInt32 from, ncfUInt32 to) const {
+    ncfUInt64 sum = 0;
+    if (entryBits_ == 32) {
+        for (const ncfUInt8* at = entries_ + ncfUInt64{4} * from;
+             at != entries_ + ncfUInt64{4} * to; at += 4) {
+            sum += LoadU32(at);
+        }
+        return sum;
+    }
+    for (; from < to; ++from) {
+        sum += Entry(from);
+    }
+    return sum;
+}
+
+ncfUInt32 SampleSizes::SizeOf(ncfUInt32 sample) const {
+    if (packets_.bytesPerPacket != 0) {
+        return packets_.bytesPerPacket;
+    }
+    return fixed_ != 0 ? fixed_ : Entry(sample);
+}
+
+ncfUInt64 SampleSizes::BytesUpTo(ncfUInt32 first, ncfUInt32 sample) const {
+    const ncfUInt32 between = sample - first;
+    if (packets_.bytesPerPacket != 0) {
+        return ncfUInt64{between / packets_.framesPerPacket} * packets_.bytesPerPacket;
+    }
+    if (fixed_ != 0) {
+        return ncfUInt64{between} * fixed_;
+    }
+    if (between <= 2 * kStep) {
+        return Sum(first, sample);
+    }
+    const ncfUInt32 firstMark = first / kStep;
+    const ncfUInt32 lastMark = sample / kStep;
+    return marks_[lastMark] + Sum(lastMark * kStep, sample) - marks_[firstMark] -
+           Sum(firstMark * kStep, first);
+}
+
+ncfUInt64 SampleSizes::BytesOf(ncfUInt32 first, ncfUInt32 count) const {
+    if (packets_.bytesPerPacket != 0) {
+        const ncfUInt64 frames = packets_.framesPerPacket;
+        return (count + frames - 1) / frames * packets_.bytesPerPacket;
+    }
+    if (fixed_ != 0) {
+        return ncfUInt64{count} * fixed_;
+    }
+    return count == 0 ? 0 : BytesUpTo(first, first + count - 1) + Entry(first + count - 1);
+}
+
+}  // namespace header_parser

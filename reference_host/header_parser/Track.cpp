@@ -1,0 +1,265 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <algorithm>
+#include <limits>
+
+#include "reference_host/header_parser/Movie.h"
+
+// One function for each atom of a track:
+//
+//     trak [ tkhd | edts [ elst ] | mdia [ mdhd | hdlr | minf [ dinf [ dref ] | stbl ] ] ]
+//
+// The atoms of one list may stand in any order, so a list is sorted first and
+// read in the order in which its parts need each other. Of several atoms of
+// one kind the first counts.
+
+namespace header_parser {
+
+namespace {
+
+constexpr ncfUInt64 kMax32 = std::numeric_limits<ncfUInt32>::max();
+
+struct TrackAtoms {
+    Atom tkhd, elst, mdhd, hdlr, vmhd, smhd, dref, stsd;
+    SampleTableAtoms tables;
+};
+
+// Where a child of a known type is kept; a list of them is one level.
+struct Slot {
+    ncfUInt32 type;
+    Atom* place;
+};
+
+Verdict SortChildren(const Atom& parent, std::initializer_list<Slot> slots) {
+    AtomList atoms(parent);
+    Atom atom;
+    while (atoms.Next(atom)) {
+        for (const Slot& slot : slots) {
+            if (slot.type == atom.type && !*slot.place) {
+                *slot.place = atom;
+            }
+        }
+    }
+    return atoms.Broken() || atoms.Closed() ? Broken("a track is not a list of atoms") : Fine();
+}
+
+Verdict SortMediaInformation(const Atom& minf, TrackAtoms& atoms) {
+    Atom dinf;
+    Atom stbl;
+    Verdict verdict = SortChildren(minf, {{Code("vmhd"), &atoms.vmhd},
+                                          {Code("smhd"), &atoms.smhd},
+                                          {Code("dinf"), &dinf},
+                                          {Code("stbl"), &stbl}});
+    if (!verdict.Refused() && dinf) {
+        verdict = SortChildren(dinf, {{Code("dref"), &atoms.dref}});
+    }
+    if (!verdict.Refused() && !stbl) {
+        verdict = Broken("a track has no sample table");
+    }
+    if (verdict.Refused()) {
+        return verdict;
+    }
+    SampleTableAtoms& tables = atoms.tables;
+    return SortChildren(stbl, {{Code("stsd"), &atoms.stsd},
+                               {Code("stts"), &tables.stts},
+                               {Code("ctts"), &tables.ctts},
+                               {Code("stsc"), &tables.stsc},
+                               {Code("stsz"), &tables.stsz},
+                               {Code("stz2"), &tables.stz2},
+                               {Code("stco"), &tables.stco},
+                               {Code("co64"), &tables.co64},
+                               {Code("stss"), &tables.stss},
+                               {Code("sdtp"), &tables.sdtp}});
+}
+
+Verdict SortTrack(const Atom& trak, TrackAtoms& atoms) {
+    Atom edts;
+    Atom mdia;
+    Atom minf;
+    Verdict verdict = SortChildren(
+        trak, {{Code("tkhd"), &atoms.tkhd}, {Code("edts"), &edts}, {Code("mdia"), &mdia}});
+    if (!verdict.Refused() && edts) {
+        verdict = SortChildren(edts, {{Code("elst"), &atoms.elst}});
+    }
+    if (!verdict.Refused() && mdia) {
+        verdict = SortChildren(
+            mdia,
+            {{Code("mdhd"), &atoms.mdhd}, {Code("hdlr"), &atoms.hdlr}, {Code("minf"), &minf}});
+    }
+    if (!verdict.Refused() && !minf) {
+        verdict = Broken("a track has no media information");
+    }
+    return verdict.Refused() ? verdict : SortMediaInformation(minf, atoms);
+}
+
+// A duration as it stands, or nothing where it is 0 or unknown.
+std::optional<ncfUInt64> KnownDuration(ncfUInt64 duration, unsigned version) {
+    const ncfUInt64 unknown = version == 1 ? std::numeric_limits<ncfUInt64>::max() : kMax32;
+    return duration == 0 || duration == unknown ? std::nullopt : std::optional(duration);
+}
+
+Verdict ReadTrackHeader(const Atom& tkhd, Track& track, std::optional<ncfUInt64>& duration) {
+    ByteReader reader(tkhd.begin, tkhd.end);
+    const unsigned version = reader.U8();
+    reader.Skip(3u + (version == 1 ? 16 : 8));
+    track.id = reader.U32();
+    reader.Skip(4);
+    duration = KnownDuration(version == 1 ? reader.U64() : reader.U32(), version);
+    reader.Skip(16);  // reserved, layer, group, volume
+    for (std::size_t i = 0; i < track.matrix.size(); ++i) {
+        const float unit = i % 3 == 2 ? 1073741824.0f : 65536.0f;
+        track.matrix[i] = static_cast<float>(reader.S32()) / unit;
+    }
+    if (reader.Failed() || version > 1) {
+        return Broken("tkhd is missing, cut short or of an unknown version");
+    }
+    return track.id != 0 ? Fine() : Broken("a track has no number");
+}
+
+Verdict ReadMediaHeader(const Atom& mdhd, Track& track, std::optional<ncfUInt64>& duration) {
+    ByteReader reader(mdhd.begin, mdhd.end);
+    const unsigned version = reader.U8();
+    reader.Skip(3u + (version == 1 ? 16 : 8));
+    track.mediaTimeScale = reader.U32();
+    duration = KnownDuration(version == 1 ? reader.U64() : reader.U32(), version);
+    if (reader.Failed() || version > 1) {
+        return Broken("mdhd is missing, cut short or of an unknown version");
+    }
+    return track.mediaTimeScale != 0 ? Fine() : Broken("a track's media has no time scale");
+}
+
+// By the handler; a very old file may have none, then by the media header.
+TrackKind KindOf(const TrackAtoms& atoms) {
+    const ncfUInt32 handler = atoms.hdlr.Size() >= 12 ? LoadU32(atoms.hdlr.begin + 8) : 0;
+    if (handler == Code("vide") || (handler == 0 && atoms.vmhd)) {
+        return TrackKind::kVideo;
+    }
+    if (handler == Code("soun") || (handler == 0 && atoms.smhd)) {
+        return TrackKind::kSound;
+    }
+    return handler == Code("tmcd") ? TrackKind::kTimecode : TrackKind::kOther;
+}
+
+// Which data references are this file itself. Without a table all are.
+Verdict ReadDataReferences(const Atom& dref, std::vector<bool>& isInFile) {
+    ByteReader reader(dref.begin, dref.end);
+    reader.Skip(4);
+    const ncfUInt32 count = reader.U32();
+    if (reader.Failed() || count > reader.Left() / 8) {
+        return Broken("dref claims more entries than it holds");
+    }
+    AtomList entries(reader.At(), reader.End());
+    Atom entry;
+    while (isInFile.size() < count && entries.Next(entry)) {
+        const ncfUInt32 flags = entry.Size() >= 4 ? LoadU32(entry.begin) : 0;
+        isInFile.push_back((flags & 1) != 0);
+    }
+    return isInFile.size() == count ? Fine() : Broken("dref holds fewer entries than it claims");
+}
+
+Verdict ReadDescription(const Atom& entry, bool isIso, const ParserLimits& limits, Track& track) {
+    switch (track.kind) {
+        case TrackKind::kVideo:
+            track.video.emplace_back();
+            return ReadVideoDescription(entry, limits, track.video.back());
+        case TrackKind::kSound:
+            track.sound.emplace_back();
+            return ReadSoundDescription(entry, isIso, track.mediaTimeScale, track.sound.back());
+        case TrackKind::kTimecode:
+            if (track.isInFile.empty()) {
+                track.timecode = ReadTimecodeDescription(entry);
+            }
+            return Fine();
+        case TrackKind::kOther:
+            break;
+    }
+    return Fine();
+}
+
+Verdict ReadDescriptions(const Atom& stsd, const std::vector<bool>& references, bool hasReferences,
+                         const ParserLimits& limits, Track& track) {
+    ByteReader reader(stsd.begin, stsd.end);
+    const bool isIso = reader.U8() != 0;
+    reader.Skip(3);
+    const ncfUInt32 count = reader.U32();
+    if (reader.Failed() || count > reader.Left() / 16) {
+        return Broken("stsd claims more entries than it holds");
+    }
+    if (count > limits.maxDescriptionsInTrack) {
+        return TooMuch("too many sample descriptions in a track");
+    }
+    AtomList entries(reader.At(), reader.End());
+    Atom entry;
+    while (track.isInFile.size() < count && entries.Next(entry)) {
+        if (entry.Size() < 8) {
+            return Broken("a sample description is cut short");
+        }
+        const unsigned reference = LoadU16(entry.begin + 6);
+        if (hasReferences && (reference == 0 || reference > references.size())) {
+            return Broken("a sample description has no data reference");
+        }
+        const Verdict verdict = ReadDescription(entry, isIso, limits, track);
+        if (verdict.Refused()) {
+            return verdict;
+        }
+        track.isInFile.push_back(!hasReferences || references[reference - 1]);
+    }
+    track.descriptionCount = count;
+    return track.isInFile.size() == count ? Fine()
+                                          : Broken("stsd holds fewer entries than it claims");
+}
+
+// The media's own duration where it is known, else that of its samples; the
+// track's is that of its edits, its header, or its media.
+Verdict SetDurations(std::optional<ncfUInt64> header, std::optional<ncfUInt64> media,
+                     ncfUInt32 movieTimeScale, Track& track) {
+    const ncfUInt64 mediaDuration = media.value_or(track.samples.Times().TotalDuration());
+    ncfUInt64 duration = track.edits.Duration();
+    if (duration == 0) {
+        duration =
+            header.value_or(MultiplyDivide(mediaDuration, movieTimeScale, track.mediaTimeScale));
+    }
+    if (mediaDuration > kMax32 || duration > kMax32) {
+        return NotSupported("a track's duration does not fit 32 bits");
+    }
+    track.mediaDuration = static_cast<ncfUInt32>(mediaDuration);
+    track.duration = static_cast<ncfUInt32>(duration);
+    return Fine();
+}
+
+}  // namespace
+
+Verdict ReadTrack(const Atom& trak, ncfUInt32 movieTimeScale, const ParserLimits& limits,
+                  Track& track) {
+    TrackAtoms atoms;
+    std::optional<ncfUInt64> headerDuration;
+    std::optional<ncfUInt64> mediaDuration;
+    Verdict verdict = SortTrack(trak, atoms);
+    if (!verdict.Refused()) {
+        verdict = ReadTrackHeader(atoms.tkhd, track, headerDuration);
+    }
+    if (!verdict.Refused()) {
+        verdict = ReadMediaHeader(atoms.mdhd, track, mediaDuration);
+    }
+    if (!verdict.Refused() && atoms.elst) {
+        verdict = track.edits.Read(atoms.elst, limits);
+    }
+    std::vector<bool> references;
+    if (!verdict.Refused() && atoms.dref) {
+        verdict = ReadDataReferences(atoms.dref, references);
+    }
+    track.kind = KindOf(atoms);
+    if (!verdict.Refused()) {
+        verdict =
+            ReadDescriptions(atoms.stsd, references, static_cast<bool>(atoms.dref), limits, track);
+    }
+    if (!verdict.Refused()) {
+        const PacketLayout oldSound =
+            track.sound.empty() ? PacketLayout() : track.sound.front().OldLayout();
+        verdict = track.samples.Read(atoms.tables, oldSound, track.isInFile);
+    }
+    return verdict.Refused() ? verdict
+                             : SetDurations(headerDuration, mediaDuration, movieTimeScale, track);
+}
+
+}  // namespace header_parser
