@@ -19,7 +19,11 @@ Verdict SampleTable::Read(const SampleTableAtoms& atoms, const PacketLayout& old
         verdict = chunks_.Read(atoms.stsc, atoms.stco, atoms.co64, sizes_, isInFile);
     }
     if (!verdict.Refused() && atoms.stss) {
-        verdict = ReadSyncSamples(atoms.stss);
+        allAreSync_ = false;
+        verdict = sync_.Read(atoms.stss, Count());
+    }
+    if (!verdict.Refused() && atoms.stps) {
+        verdict = partialSync_.Read(atoms.stps, Count());
     }
     if (!verdict.Refused() && atoms.sdtp) {
         if (atoms.sdtp.Size() < 4 || atoms.sdtp.Size() - 4 < Count()) {
@@ -30,27 +34,37 @@ Verdict SampleTable::Read(const SampleTableAtoms& atoms, const PacketLayout& old
     return verdict;
 }
 
-Verdict SampleTable::ReadSyncSamples(const Atom& stss) {
-    ByteReader reader(stss.begin, stss.end);
+Verdict SampleTable::NumberList::Read(const Atom& atom, ncfUInt32 sampleCount) {
+    ByteReader reader(atom.begin, atom.end);
     reader.Skip(4);
-    syncCount_ = reader.U32();
-    syncSamples_ = reader.At();
-    if (reader.Failed() || syncCount_ > reader.Left() / 4) {
-        return Broken("stss claims more entries than it holds");
+    count = reader.U32();
+    numbers = reader.At();
+    if (reader.Failed() || count > reader.Left() / 4) {
+        return Broken("the sync sample table claims more entries than it holds");
     }
     ncfUInt32 last = 0;
-    for (ncfUInt32 i = 0; i < syncCount_; ++i) {
+    for (ncfUInt32 i = 0; i < count; ++i) {
         const ncfUInt32 number = reader.U32();
         if (number <= last) {
-            return Broken("the samples of stss do not rise");
+            return Broken("the numbers of the sync samples do not rise");
         }
         last = number;
     }
-    if (last > Count()) {
-        return Broken("stss names samples that the track lacks");
+    return last <= sampleCount ? Fine() : Broken("there are sync samples that the track lacks");
+}
+
+bool SampleTable::NumberList::Holds(ncfUInt32 number) const {
+    ncfUInt32 low = 0;
+    ncfUInt32 high = count;
+    while (low < high) {
+        const ncfUInt32 middle = low + (high - low) / 2;
+        const ncfUInt32 found = LoadU32(numbers + ncfUInt64{4} * middle);
+        if (found == number) {
+            return true;
+        }
+        found < number ? low = middle + 1 : high = middle;
     }
-    allAreSync_ = false;
-    return Fine();
+    return false;
 }
 
 ncfUInt64 SampleTable::PositionOf(ncfUInt32 sample) const {
@@ -59,20 +73,7 @@ ncfUInt64 SampleTable::PositionOf(ncfUInt32 sample) const {
 }
 
 bool SampleTable::IsSync(ncfUInt32 sample) const {
-    if (allAreSync_) {
-        return true;
-    }
-    ncfUInt32 low = 0;
-    ncfUInt32 high = syncCount_;
-    while (low < high) {
-        const ncfUInt32 middle = low + (high - low) / 2;
-        const ncfUInt32 number = LoadU32(syncSamples_ + ncfUInt64{4} * middle);
-        if (number == sample + 1) {
-            return true;
-        }
-        number < sample + 1 ? low = middle + 1 : high = middle;
-    }
-    return false;
+    return allAreSync_ || sync_.Holds(sample + 1) || partialSync_.Holds(sample + 1);
 }
 
 bool SampleTable::IsDisposable(ncfUInt32 sample) const {

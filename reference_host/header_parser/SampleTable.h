@@ -12,7 +12,7 @@ namespace header_parser {
 
 // Atoms of a sample table, wherever they stood within it.
 struct SampleTableAtoms {
-    Atom stts, ctts, stsc, stsz, stz2, stco, co64, stss, sdtp;
+    Atom stts, ctts, stsc, stsz, stz2, stco, co64, stss, stps, sdtp;
 };
 
 // All that is known of a track's samples. Nothing here costs memory for each
@@ -34,14 +34,21 @@ public:
     ncfUInt32 NextBreak(ncfUInt32 sample) const;
 
 private:
-    Verdict ReadSyncSamples(const Atom& stss);
+    // A rising list of sample numbers, as stss and stps hold it.
+    struct NumberList {
+        const ncfUInt8* numbers = nullptr;
+        ncfUInt32 count = 0;
+
+        Verdict Read(const Atom& atom, ncfUInt32 sampleCount);
+        bool Holds(ncfUInt32 number) const;
+    };
 
     SampleSizes sizes_;
     SampleTimes times_;
     ChunkMap chunks_;
     bool allAreSync_ = true;
-    const ncfUInt8* syncSamples_ = nullptr;
-    ncfUInt32 syncCount_ = 0;
+    NumberList sync_;
+    NumberList partialSync_;                  // those decode by themselves too
     const ncfUInt8* dependencies_ = nullptr;  // one byte a sample, or null
 };
 

@@ -39,6 +39,19 @@ TimecodeAddress AddressOf(ncfUInt64 frame, const TimecodeDescription& descriptio
     return address;
 }
 
+// The stored number is the rate rounded up. Some recorders cut it off, and
+// write 29 for 29.97; they still count in thirties.
+ncfUInt32 FramesPerSecond(const TimecodeDescription& description) {
+    if (description.frameDuration == 0 || description.IsCounter()) {
+        return description.numFrames;
+    }
+    const ncfUInt32 whole = description.timeScale / description.frameDuration;
+    const ncfUInt32 rest = description.timeScale % description.frameDuration;
+    const bool isCutOff = description.numFrames == whole && whole != 0 && whole < 255 &&
+                          rest >= description.frameDuration - rest;
+    return isCutOff ? whole + 1 : description.numFrames;
+}
+
 // Hours, minutes with the sign on top, seconds and frames, one byte each.
 bool IsPackedAddress(const ncfUInt8* sample, const TimecodeDescription& description) {
     return sample[0] < 24 && (sample[1] & 0x7F) < 60 && sample[2] < 60 &&
@@ -55,6 +68,7 @@ TimecodeDescription ReadTimecodeDescription(const Atom& entry) {
     description.timeScale = reader.U32();
     description.frameDuration = reader.U32();
     description.numFrames = reader.U8();
+    description.numFrames = FramesPerSecond(description);
     description.isPresent = !reader.Failed() && entry.type == Code("tmcd");
     return description;
 }

@@ -69,6 +69,7 @@ Verdict SortMediaInformation(const Atom& minf, TrackAtoms& atoms) {
                                {Code("stco"), &tables.stco},
                                {Code("co64"), &tables.co64},
                                {Code("stss"), &tables.stss},
+                               {Code("stps"), &tables.stps},
                                {Code("sdtp"), &tables.sdtp}});
 }
 
@@ -194,15 +195,18 @@ Verdict ReadDescriptions(const Atom& stsd, const std::vector<bool>& references, 
         if (entry.Size() < 8) {
             return Broken("a sample description is cut short");
         }
-        const unsigned reference = LoadU16(entry.begin + 6);
-        if (hasReferences && (reference == 0 || reference > references.size())) {
-            return Broken("a sample description has no data reference");
-        }
         const Verdict verdict = ReadDescription(entry, isIso, limits, track);
         if (verdict.Refused()) {
             return verdict;
         }
-        track.isInFile.push_back(!hasReferences || references[reference - 1]);
+        const unsigned reference = LoadU16(entry.begin + 6);
+        const bool isListed = reference != 0 && reference <= references.size();
+        // Some recorders name no reference where they mean their own file, and
+        // some descriptions of other data do not even have the field.
+        if (hasReferences && !isListed && reference != 0 && track.kind != TrackKind::kOther) {
+            return Broken("a sample description has no data reference");
+        }
+        track.isInFile.push_back(!isListed || references[reference - 1]);
     }
     track.descriptionCount = count;
     return track.isInFile.size() == count ? Fine()
