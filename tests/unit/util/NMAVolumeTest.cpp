@@ -1,0 +1,149 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "host_interfaces/util/NMAVolume.h"
+
+#include <sys/stat.h>
+#include <sys/statvfs.h>
+#include <utime.h>
+
+#include <set>
+
+#include "tests/unit/util/UtilFixture.h"
+
+class NMAVolumeTest : public UtilTest {
+protected:
+    host::Ref<host::String> FolderPath() const { return host::ModulePath(folder_.path()); }
+
+    std::set<std::string> Names(const char* pattern) const {
+        NMAVolume volume(FolderPath().get());
+        void* handle = nullptr;
+        std::set<std::string> names;
+        for (INCFString* file = volume.GetFirstFile(pattern, handle); file != nullptr;
+             file = volume.GetNextFile(handle)) {
+            names.insert(Taken(file));
+        }
+        EXPECT_EQ(nullptr, handle) << "a search that is over has no handle";
+        return names;
+    }
+
+    TemporaryFolder folder_;
+};
+
+TEST_F(NMAVolumeTest, FindsFilesThatMatchThePattern) {
+    folder_.Write("a.mov");
+    folder_.Write("b.mov");
+    folder_.Write("c.mp4");
+    EXPECT_EQ((std::set<std::string>{"a.mov", "b.mov"}), Names("*.mov"));
+    EXPECT_EQ((std::set<std::string>{"c.mp4"}), Names("*.mp4"));
+}
+
+TEST_F(NMAVolumeTest, CaseFollowsTheFileSystem) {
+    folder_.Write("A.MOV");
+    EXPECT_TRUE(Names("*.mov").empty());
+    EXPECT_EQ(std::set<std::string>{"A.MOV"}, Names("*.MOV"));
+}
+
+TEST_F(NMAVolumeTest, FindsHiddenFiles) {
+    folder_.Write(".hidden.mov");
+    EXPECT_EQ(std::set<std::string>{".hidden.mov"}, Names("*.mov"));
+}
+
+TEST_F(NMAVolumeTest, LeavesOutFoldersPipesAndBrokenLinks) {
+    std::filesystem::create_directory(folder_.path() / "folder.mov");
+    ASSERT_EQ(0, mkfifo((folder_.path() / "pipe.mov").c_str(), 0600));
+    std::filesystem::create_symlink("nothing", folder_.path() / "broken.mov");
+    std::filesystem::create_directory_symlink("folder.mov", folder_.path() / "link.mov");
+    EXPECT_TRUE(Names("*.mov").empty());
+}
+
+TEST_F(NMAVolumeTest, FindsLinksToFiles) {
+    folder_.Write("target.bin");
+    std::filesystem::create_symlink("target.bin", folder_.path() / "link.mov");
+    EXPECT_EQ(std::set<std::string>{"link.mov"}, Names("*.mov"));
+}
+
+TEST_F(NMAVolumeTest, CarriesNamesThatAreNoUtf8) {
+    folder_.Write("a\xE9.mov");
+    EXPECT_EQ(std::set<std::string>{"a\xE9.mov"}, Names("*.mov"));
+}
+
+TEST_F(NMAVolumeTest, AFolderThatIsNotThereHasNoFiles) {
+    NMAVolume missing(host::MakeString("/no/such/folder").get());
+    void* handle = &missing;
+    EXPECT_EQ(nullptr, missing.GetFirstFile("*", handle));
+    EXPECT_EQ(nullptr, handle);
+    NMAVolume nowhere(nullptr);
+    EXPECT_EQ(nullptr, nowhere.GetFirstFile("*", handle));
+    EXPECT_EQ(nullptr, nowhere.GetFirstFile(nullptr, handle));
+}
+
+TEST_F(NMAVolumeTest, ASearchEndsWithItsVolume) {
+    folder_.Write("a.mov");
+    folder_.Write("b.mov");
+    NMAVolume volume(FolderPath().get());
+    void* first = nullptr;
+    void* second = nullptr;
+    Taken(volume.GetFirstFile("*.mov", first));
+    Taken(volume.GetFirstFile("*.mov", second));
+    EXPECT_NE(first, second) << "two searches go side by side";
+    EXPECT_NE("(null)", Taken(volume.GetNextFile(first)));
+    EXPECT_EQ(nullptr, volume.GetNextFile(first));
+    EXPECT_EQ(nullptr, first);
+    EXPECT_NE("(null)", Taken(volume.GetNextFile(second)));
+}
+
+TEST_F(NMAVolumeTest, AStrangeHandleGivesNothing) {
+    NMAVolume volume(FolderPath().get());
+    void* strange = &volume;
+    EXPECT_EQ(nullptr, volume.GetNextFile(strange));
+    EXPECT_EQ(nullptr, strange);
+}
+
+TEST_F(NMAVolumeTest, GivesTheDateOfAFileInSeconds) {
+    const auto file = folder_.Write("a.mov");
+    const utimbuf times{1000000000, 1234567890};
+    ASSERT_EQ(0, utime(file.c_str(), &times));
+    NMAVolume volume(FolderPath().get());
+    EXPECT_EQ(1234567890u, volume.GetModificationDate(host::MakeString("a.mov").get()));
+    EXPECT_EQ(0u, volume.GetModificationDate(host::MakeString("b.mov").get()));
+    EXPECT_EQ(0u, volume.GetModificationDate(host::MakeString("").get()));
+    EXPECT_EQ(0u, volume.GetModificationDate(nullptr));
+}
+
+TEST_F(NMAVolumeTest, SerialNumberIsTheLowHalfOfTheFileSystemsId) {
+    struct statvfs facts {};
+    ASSERT_EQ(0, statvfs(folder_.path().c_str(), &facts));
+    NMAVolume volume(FolderPath().get());
+    EXPECT_EQ(static_cast<ncfUInt32>(facts.f_fsid), volume.GetVolumeSerialNumber());
+    EXPECT_EQ(0u, NMAVolume(host::MakeString("/no/such").get()).GetVolumeSerialNumber());
+}
+
+TEST_F(NMAVolumeTest, LabelIsTheNameOfTheMountPoint) {
+    NMAVolume root(host::MakeString("\\").get());
+    EXPECT_EQ("", Taken(root.GetVolumeLabel()));
+    // The kernel's own file system is a volume of its own everywhere.
+    NMAVolume proc(host::MakeString("\\proc\\self").get());
+    EXPECT_EQ("proc", Taken(proc.GetVolumeLabel()));
+    NMAVolume missing(host::MakeString("/no/such").get());
+    EXPECT_EQ("", Taken(missing.GetVolumeLabel())) << "never null";
+}
+
+TEST_F(NMAVolumeTest, TypeIsOneOfTheKnownKinds) {
+    NMAVolume volume(FolderPath().get());
+    const std::set<ncfUInt32> kinds = {0, 2, 3, 4};
+    EXPECT_EQ(1u, kinds.count(volume.GetVolumeType()));
+    // A file system without a disk can't be taken out.
+    EXPECT_EQ(3u, NMAVolume(host::MakeString("/proc").get()).GetVolumeType());
+    EXPECT_EQ(0u, NMAVolume(host::MakeString("/no/such").get()).GetVolumeType());
+}
+
+TEST_F(NMAVolumeTest, EndsASearchWhenTheHostRefusesAString) {
+    folder_.Write("a.mov");
+    const auto path = FolderPath();
+    NMAVolume volume(path.get());
+    host_.factory().SetRule([](const host::CreationCall&) { return NCF_E_OUTOFMEMORY; });
+    void* handle = nullptr;
+    EXPECT_EQ(nullptr, volume.GetFirstFile("*.mov", handle));
+    EXPECT_EQ(nullptr, handle);
+    EXPECT_NE(nullptr, volume.GetVolumeLabel());
+}

@@ -1,0 +1,33 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/util/text/Paths.h"
+
+#include <gtest/gtest.h>
+
+namespace text = host::text;
+
+TEST(Paths, TurnsBackslashesBackForTheSystem) {
+    std::filesystem::path path;
+    ASSERT_TRUE(text::ToSystemPath(U"\\home\\me/clip.mov", path));
+    EXPECT_EQ("/home/me/clip.mov", path.native());
+}
+
+TEST(Paths, GivesCarriedBytesBackToTheSystem) {
+    std::filesystem::path path;
+    ASSERT_TRUE(text::ToSystemPath(std::u32string{U'\\', U'a', 0xDCE9}, path));
+    EXPECT_EQ("/a\xE9", path.native());
+    EXPECT_EQ((std::u32string{U'\\', U'a', 0xDCE9}), text::ToModulePath(path));
+    EXPECT_EQ((std::u32string{U'/', U'a', 0xDCE9}), text::FromSystemPath(path));
+}
+
+TEST(Paths, RefusesWhatNoFileNameCanHold) {
+    std::filesystem::path path = "as before";
+    EXPECT_FALSE(text::ToSystemPath(std::u32string(U"a\0b", 3), path));
+    EXPECT_FALSE(text::ToSystemPath(std::u32string{U'a', 0xD800}, path));
+    EXPECT_EQ("as before", path.native());
+}
+
+TEST(Paths, SeesABackslashThatIsPartOfAName) {
+    EXPECT_TRUE(text::HoldsBackslash("/media/a\\b.mov"));
+    EXPECT_FALSE(text::HoldsBackslash("/media/ab.mov"));
+}
