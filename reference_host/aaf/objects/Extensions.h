@@ -1,0 +1,15 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "host_interfaces/aaf/AAFPlainTypes.h"
+
+namespace aaf {
+
+class Model;
+
+// Registers with the target whatever was registered with the source beyond the
+// built-in model, also what nothing uses yet.
+HRESULT CopyExtensions(Model& source, Model& target);
+
+}  // namespace aaf

@@ -1,0 +1,109 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/aaf/objects/ObjectClasses.h"
+
+#include "host_interfaces/aaf/AAFClassIds.h"
+#include "reference_host/aaf/model/Model.h"
+#include "reference_host/aaf/objects/CDCIDescriptor.h"
+#include "reference_host/aaf/objects/CompositionMob.h"
+#include "reference_host/aaf/objects/ContentStorage.h"
+#include "reference_host/aaf/objects/EssenceData.h"
+#include "reference_host/aaf/objects/Header.h"
+#include "reference_host/aaf/objects/Identification.h"
+#include "reference_host/aaf/objects/KLVData.h"
+#include "reference_host/aaf/objects/Locator.h"
+#include "reference_host/aaf/objects/MPEGVideoDescriptor.h"
+#include "reference_host/aaf/objects/MasterMob.h"
+#include "reference_host/aaf/objects/MobSlot.h"
+#include "reference_host/aaf/objects/MultipleDescriptor.h"
+#include "reference_host/aaf/objects/OtherComponents.h"
+#include "reference_host/aaf/objects/OtherFileDescriptors.h"
+#include "reference_host/aaf/objects/PCMDescriptor.h"
+#include "reference_host/aaf/objects/PhysicalDescriptors.h"
+#include "reference_host/aaf/objects/RGBADescriptor.h"
+#include "reference_host/aaf/objects/Sequence.h"
+#include "reference_host/aaf/objects/SourceClip.h"
+#include "reference_host/aaf/objects/SourceMob.h"
+#include "reference_host/aaf/objects/TaggedValue.h"
+#include "reference_host/aaf/objects/Timecode.h"
+
+namespace aaf {
+
+namespace {
+
+// Abstract classes stand here too: the classes that another program derived
+// from them are made with them.
+const ClassEntry kClasses[] = {
+    {AUID_AAFFiller, &CreateAs<Filler>},
+    {AUID_AAFSequence, &CreateAs<Sequence>},
+    {AUID_AAFSourceReference, &CreateAs<SourceReference>},
+    {AUID_AAFSourceClip, &CreateAs<SourceClip>},
+    {AUID_AAFComponent, &CreateAs<Component>},
+    {AUID_AAFSegment, &CreateAs<Segment>},
+    {AUID_AAFTimecode, &CreateAs<Timecode>},
+    {AUID_AAFEdgecode, &CreateAs<Edgecode>},
+    {AUID_AAFTransition, &CreateAs<Transition>},
+    {AUID_AAFOperationGroup, &CreateAs<OperationGroup>},
+    {AUID_AAFNestedScope, &CreateAs<NestedScope>},
+    {AUID_AAFScopeReference, &CreateAs<ScopeReference>},
+    {AUID_AAFSelector, &CreateAs<Selector>},
+    {AUID_AAFEssenceGroup, &CreateAs<EssenceGroup>},
+    {AUID_AAFPulldown, &CreateAs<Pulldown>},
+    {AUID_AAFEvent, &CreateAs<Event>},
+    {AUID_AAFCommentMarker, &CreateAs<CommentMarker>},
+    {AUID_AAFGPITrigger, &CreateAs<GPITrigger>},
+    {AUID_AAFParameter, &CreateAs<Parameter>},
+    {AUID_AAFConstantValue, &CreateAs<ConstantValue>},
+    {AUID_AAFVaryingValue, &CreateAs<VaryingValue>},
+    {AUID_AAFControlPoint, &CreateAs<ControlPoint>},
+    {AUID_AAFMob, &CreateAs<Mob>},
+    {AUID_AAFMasterMob, &CreateAs<MasterMob>},
+    {AUID_AAFSourceMob, &CreateAs<SourceMob>},
+    {AUID_AAFCompositionMob, &CreateAs<CompositionMob>},
+    {AUID_AAFMobSlot, &CreateAs<MobSlot>},
+    {AUID_AAFTimelineMobSlot, &CreateAs<TimelineMobSlot>},
+    {AUID_AAFStaticMobSlot, &CreateAs<StaticMobSlot>},
+    {AUID_AAFEventMobSlot, &CreateAs<EventMobSlot>},
+    {AUID_AAFEssenceDescriptor, &CreateAs<EssenceDescriptor>},
+    {AUID_AAFFileDescriptor, &CreateAs<FileDescriptor>},
+    {AUID_AAFMultipleDescriptor, &CreateAs<MultipleDescriptor>},
+    {AUID_AAFDigitalImageDescriptor, &CreateAs<DigitalImageDescriptor>},
+    {AUID_AAFCDCIDescriptor, &CreateAs<CDCIDescriptor>},
+    {AUID_AAFMPEGVideoDescriptor, &CreateAs<MPEGVideoDescriptor>},
+    {AUID_AAFRGBADescriptor, &CreateAs<RGBADescriptor>},
+    {AUID_AAFSoundDescriptor, &CreateAs<SoundDescriptor>},
+    {AUID_AAFPCMDescriptor, &CreateAs<PCMDescriptor>},
+    {AUID_AAFAES3PCMDescriptor, &CreateAs<AES3PCMDescriptor>},
+    {AUID_AAFAIFCDescriptor, &CreateAs<AIFCDescriptor>},
+    {AUID_AAFWAVEDescriptor, &CreateAs<WAVEDescriptor>},
+    {AUID_AAFTIFFDescriptor, &CreateAs<TIFFDescriptor>},
+    {AUID_AAFDataEssenceDescriptor, &CreateAs<DataEssenceDescriptor>},
+    {AUID_AAFPhysicalDescriptor, &CreateAs<PhysicalDescriptor>},
+    {AUID_AAFImportDescriptor, &CreateAs<ImportDescriptor>},
+    {AUID_AAFRecordingDescriptor, &CreateAs<RecordingDescriptor>},
+    {AUID_AAFAuxiliaryDescriptor, &CreateAs<AuxiliaryDescriptor>},
+    {AUID_AAFTapeDescriptor, &CreateAs<TapeDescriptor>},
+    {AUID_AAFFilmDescriptor, &CreateAs<FilmDescriptor>},
+    {AUID_AAFLocator, &CreateAs<Locator>},
+    {AUID_AAFNetworkLocator, &CreateAs<NetworkLocator>},
+    {AUID_AAFTextLocator, &CreateAs<TextLocator>},
+    {AUID_AAFTaggedValue, &CreateAs<TaggedValue>},
+    {AUID_AAFKLVData, &CreateAs<KLVData>},
+    {AUID_AAFHeader, &CreateAs<Header>},
+    {AUID_AAFContentStorage, &CreateAs<ContentStorage>},
+    {AUID_AAFIdentification, &CreateAs<Identification>},
+    {AUID_AAFEssenceData, &CreateAs<EssenceData>},
+};
+
+}  // namespace
+
+const ClassRegistry& ObjectClasses() {
+    static const ClassRegistry registry = [] {
+        ClassRegistry made;
+        made.Add(kClasses);
+        return made;
+    }();
+    return registry;
+}
+
+}  // namespace aaf

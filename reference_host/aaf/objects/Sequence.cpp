@@ -1,0 +1,183 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/aaf/objects/Sequence.h"
+
+#include "host_interfaces/aaf/AAFDefinitionIds.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "reference_host/aaf/model/Enumerator.h"
+#include "reference_host/aaf/objects/Definitions.h"
+#include "reference_host/aaf/objects/OtherComponents.h"
+
+namespace aaf {
+
+namespace {
+
+struct Conversion {
+    aafUID_t from;
+    aafUID_t to;
+};
+
+// The older and the newer id of a kind stand for each other; a picture with a
+// matte can be used as a picture.
+constexpr Conversion kConversions[] = {
+    {kAAFDataDef_LegacyPicture, kAAFDataDef_Picture},
+    {kAAFDataDef_Picture, kAAFDataDef_LegacyPicture},
+    {kAAFDataDef_LegacySound, kAAFDataDef_Sound},
+    {kAAFDataDef_Sound, kAAFDataDef_LegacySound},
+    {kAAFDataDef_LegacyTimecode, kAAFDataDef_Timecode},
+    {kAAFDataDef_Timecode, kAAFDataDef_LegacyTimecode},
+    {kAAFDataDef_PictureWithMatte, kAAFDataDef_Picture},
+    {kAAFDataDef_PictureWithMatte, kAAFDataDef_LegacyPicture},
+};
+
+bool IsConvertible(const aafUID_t& from, const aafUID_t& to) {
+    if (from == to) {
+        return true;
+    }
+    for (const Conversion& conversion : kConversions) {
+        if (conversion.from == from && conversion.to == to) {
+            return true;
+        }
+    }
+    return false;
+}
+
+bool IsTransition(const Component* component) {
+    return dynamic_cast<const Transition*>(component) != nullptr;
+}
+
+bool IsEvent(const Component* component) {
+    return dynamic_cast<const Event*>(component) != nullptr;
+}
+
+aafLength_t LengthOf(const Component& component) {
+    return component.IntegerOr(prop::Component_Length, 0);
+}
+
+// What a component adds to the sequence: a transition lies over its neighbours
+// and so shortens it.
+aafLength_t LengthAdded(const Component& component) {
+    return IsTransition(&component) ? -LengthOf(component) : LengthOf(component);
+}
+
+}  // namespace
+
+HRESULT Sequence::Initialize(IAAFDataDef* dataDef) {
+    return SetDataDef(dataDef);
+}
+
+Component* Sequence::ComponentAt(aafUInt32 index) const {
+    return dynamic_cast<Component*>(ObjectAt(prop::Sequence_Components, index));
+}
+
+HRESULT Sequence::CheckDataDefinition(Component& component) {
+    const Unknown* own = WeakTarget(prop::Component_DataDefinition);
+    if (own == nullptr) {
+        return AAFRESULT_SUCCESS;
+    }
+    IAAFDataDef* theirs = nullptr;
+    const HRESULT result = component.GetDataDef(&theirs);
+    if (result < 0) {
+        return result;
+    }
+    const RefPtr<IAAFDataDef> holder = RefPtr<IAAFDataDef>::Adopt(theirs);
+    aafUID_t from{};
+    aafUID_t to{};
+    ReadDefinitionId(theirs, from);
+    ReadDefinitionId(WeakTarget(prop::Component_DataDefinition)->Identity(), to);
+    return IsConvertible(from, to) ? AAFRESULT_SUCCESS : AAFRESULT_INVALID_DATADEF;
+}
+
+HRESULT Sequence::CheckNeighbours(const Component& component, aafUInt32 index) const {
+    const Component* const before = index == 0 ? nullptr : ComponentAt(index - 1);
+    const Component* const behind = ComponentAt(index);
+    const Component* const any = before != nullptr ? before : behind;
+    if (any != nullptr && IsEvent(any) != IsEvent(&component)) {
+        return AAFRESULT_EVENT_SEMANTICS;
+    }
+    const bool transition = IsTransition(&component);
+    if (transition && before == nullptr) {
+        return AAFRESULT_LEADING_TRAN;
+    }
+    for (const Component* neighbour : {before, behind}) {
+        if (neighbour == nullptr || (!transition && !IsTransition(neighbour))) {
+            continue;
+        }
+        if (transition && IsTransition(neighbour)) {
+            return AAFRESULT_ADJACENT_TRAN;
+        }
+        const aafLength_t overlap = LengthOf(transition ? component : *neighbour);
+        if (LengthOf(transition ? *neighbour : component) < overlap) {
+            return AAFRESULT_INSUFF_TRAN_MATERIAL;
+        }
+    }
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT Sequence::AppendComponent(IAAFComponent* component) {
+    return InsertComponentAt(CountObjects(prop::Sequence_Components), component);
+}
+
+HRESULT Sequence::PrependComponent(IAAFComponent* component) {
+    return InsertComponentAt(0, component);
+}
+
+HRESULT Sequence::InsertComponentAt(aafUInt32 index, IAAFComponent* component) {
+    if (component == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (index > CountObjects(prop::Sequence_Components)) {
+        return AAFRESULT_BADINDEX;
+    }
+    Component* const added = ImplementationAs<Component>(component);
+    if (added == nullptr) {
+        return AAFRESULT_INVALID_OBJ;
+    }
+    if (added->owner() != nullptr) {
+        return AAFRESULT_OBJECT_ALREADY_ATTACHED;
+    }
+    HRESULT result = CheckDataDefinition(*added);
+    if (result >= 0) {
+        result = CheckNeighbours(*added, index);
+    }
+    if (result < 0) {
+        return result;
+    }
+    if (!added->IsPresent(prop::Component_Length)) {
+        return AAFRESULT_PROP_NOT_PRESENT;
+    }
+    aafLength_t sum = 0;
+    const aafLength_t before = LengthOf(*this);
+    if (__builtin_add_overflow(before, LengthAdded(*added), &sum) || sum < 0) {
+        return AAFRESULT_BAD_LENGTH;
+    }
+    result = InsertObjectAt(prop::Sequence_Components, index, component);
+    return result < 0 ? result : PutInteger(prop::Component_Length, sum);
+}
+
+HRESULT Sequence::GetComponentAt(aafUInt32 index, IAAFComponent** component) {
+    return ReadObjectAt(prop::Sequence_Components, index, component);
+}
+
+HRESULT Sequence::RemoveComponentAt(aafUInt32 index) {
+    const Component* const removed = ComponentAt(index);
+    if (removed == nullptr) {
+        return AAFRESULT_BADINDEX;
+    }
+    aafLength_t rest = 0;
+    if (__builtin_sub_overflow(LengthOf(*this), LengthAdded(*removed), &rest) || rest < 0) {
+        rest = 0;  // the length was set by hand and no longer the sum
+    }
+    const HRESULT result = RemoveObjectAt(prop::Sequence_Components, index);
+    return result < 0 ? result : PutInteger(prop::Component_Length, rest);
+}
+
+HRESULT Sequence::CountComponents(aafUInt32* result) {
+    return ReadCount(prop::Sequence_Components, result);
+}
+
+HRESULT Sequence::GetComponents(IEnumAAFComponents** enumerator) {
+    return MakeEnumerator<IAAFComponent>(this, prop::Sequence_Components, enumerator);
+}
+
+}  // namespace aaf
