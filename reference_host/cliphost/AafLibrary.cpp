@@ -1,0 +1,130 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/AafLibrary.h"
+
+#include <fmt/format.h>
+
+#include <system_error>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using host::DisplayPath;
+
+// Pins what the library would take from clock and chance; our own library has
+// it beside the published functions.
+using PinTimeFunction = HRESULT (*)(const aafTimeStamp_t* time, const aafUID_t* generation);
+
+constexpr aafUID_t kPinnedGeneration = ncfGuid("00000000-0000-0000-0000-000000000001");
+
+}  // namespace
+
+AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
+    std::string reason;
+    if (!library_.Open(file, reason)) {
+        throw Failure(kExitCaller,
+                      fmt::format("{}: the AAF library can't be loaded: {}; name another with "
+                                  "--aaf-library FILE",
+                                  DisplayPath(file), reason));
+    }
+    for (const char* const name : {"AAFFileOpenTransient", "AAFFileOpenExistingRead",
+                                   "AAFFileOpenNewModifyEx"}) {
+        if (!library_.Find(name)) {
+            throw Failure(kExitCaller, fmt::format("{}: is no AAF library: it lacks {}",
+                                                   DisplayPath(file), name));
+        }
+    }
+}
+
+bool AafLibrary::PinTime(const aafTimeStamp_t& time) {
+    const auto pin = find<PinTimeFunction>("AAFCliphostPinTime");
+    return pin && pin(&time, &kPinnedGeneration) >= 0;
+}
+
+void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
+    const auto openNew = find<AAFFileOpenNewModifyExFunction>("AAFFileOpenNewModifyEx");
+    aafCharacter company[] = L"Cliphost";
+    aafCharacter product[] = L"cliphost";
+    aafCharacter version[] = L"1.3.2";
+    aafCharacter platform[] = L"";
+    aafProductVersion_t productVersion{1, 3, 2, 0, kAAFVersionReleased};
+    aafProductIdentification_t identification{};
+    identification.companyName = company;
+    identification.productName = product;
+    identification.productVersionString = version;
+    identification.productID = ncfGuid("6E2E6B0C-53C1-4D4B-8B1D-2F9C6A7E1C55");
+    identification.platform = platform;
+    identification.productVersion = &productVersion;
+
+    const auto check = [&](HRESULT result, const char* step) {
+        if (result < 0) {
+            const std::string reason = TextOfResult(result);
+            throw Failure(kExitFile,
+                          fmt::format("{}: not saved: {} failed: {}", DisplayPath(path), step,
+                                      reason.empty() ? fmt::format("0x{:08X}",
+                                                                   static_cast<ncfUInt32>(result))
+                                                     : reason));
+        }
+    };
+    // A library may refuse to open over a file that exists.
+    const std::filesystem::path fresh = path.string() + ".new";
+    std::error_code ignored;
+    std::filesystem::remove(fresh, ignored);
+    try {
+        AafRef<IAAFFile> copy;
+        check(openNew(Wide(DisplayPath(fresh)).c_str(), &kAAFFileKind_Aaf512Binary, 0,
+                      &identification, copy.Out()),
+              "opening a new file");
+        check(file->SaveCopyAs(copy.get()), "copying the description");
+        check(copy->Save(), "saving");
+        check(copy->Close(), "closing");
+    } catch (...) {
+        std::filesystem::remove(fresh, ignored);
+        throw;
+    }
+    std::error_code error;
+    std::filesystem::rename(fresh, path, error);
+    if (error) {
+        std::filesystem::remove(fresh, ignored);
+        throw Failure(kExitFile,
+                      fmt::format("{}: not saved: {}", DisplayPath(path), error.message()));
+    }
+}
+
+AafRef<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
+    const auto openRead = find<AAFFileOpenExistingReadFunction>("AAFFileOpenExistingRead");
+    AafRef<IAAFFile> file;
+    const HRESULT result = openRead(Wide(DisplayPath(path)).c_str(), 0, file.Out());
+    if (result < 0) {
+        throw Failure(kExitFile, fmt::format("{}: can't be read as AAF: {}", DisplayPath(path),
+                                             TextOfResult(result)));
+    }
+    return file;
+}
+
+std::string AafLibrary::TextOfResult(HRESULT result) const {
+    const auto length = find<AAFResultToTextBufLenFunction>("AAFResultToTextBufLen");
+    const auto text = find<AAFResultToTextFunction>("AAFResultToText");
+    aafUInt32 bytes = 0;
+    if (!length || !text || length(result, &bytes) < 0 || bytes == 0) {
+        return {};
+    }
+    std::wstring wide(bytes / sizeof(aafCharacter) + 1, L'\0');
+    return text(result, wide.data(), bytes) < 0 ? std::string() : Utf8(wide.c_str());
+}
+
+std::string AafLibrary::Version() const {
+    const auto get = find<AAFGetLibraryVersionFunction>("AAFGetLibraryVersion");
+    aafProductVersion_t version{};
+    if (!get || get(&version) < 0) {
+        return "unknown";
+    }
+    return fmt::format("{}.{}.{}.{}", version.major, version.minor, version.tertiary,
+                       version.patchLevel);
+}
+
+}  // namespace cliphost

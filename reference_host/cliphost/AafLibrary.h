@@ -1,0 +1,49 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <optional>
+
+#include "host_interfaces/aaf/AAFExports.h"
+#include "host_interfaces/aaf/AAFFile.h"
+#include "reference_host/cliphost/AafRef.h"
+#include "reference_host/framework/SharedLibrary.h"
+
+namespace cliphost {
+
+// The AAF run-time library of this process. It is loaded before the module, so
+// that the module, which asks for it by its bare name, gets the same one: the
+// system answers that name with the library that is loaded already.
+class AafLibrary {
+public:
+    // Loads a file. Throws a Failure that names it when it can't be used.
+    explicit AafLibrary(const std::filesystem::path& file);
+
+    const std::filesystem::path& file() const { return file_; }
+
+    // Makes files reproducible: every time stamp and generation id that the
+    // library makes up is this one. false when the library has no such thing.
+    bool PinTime(const aafTimeStamp_t& time);
+
+    // Saves a copy of a file with the published calls. An existing file is
+    // replaced once the new one is whole. Throws a Failure.
+    void Save(IAAFFile* file, const std::filesystem::path& path) const;
+    // Opens a saved file for reading. Throws a Failure.
+    AafRef<IAAFFile> Open(const std::filesystem::path& path) const;
+
+    // The library's own text for one of its codes, empty when it has none.
+    std::string TextOfResult(HRESULT result) const;
+    std::string Version() const;
+
+private:
+    template <class Function>
+    Function find(const char* name) const {
+        return reinterpret_cast<Function>(library_.Find(name));
+    }
+
+    std::filesystem::path file_;
+    host::SharedLibrary library_;
+};
+
+}  // namespace cliphost

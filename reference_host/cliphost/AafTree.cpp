@@ -1,0 +1,165 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/AafTree.h"
+
+#include <algorithm>
+
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFObjects.h"
+#include "reference_host/cliphost/AafValue.h"
+
+namespace cliphost {
+namespace {
+
+constexpr int kDeepest = 32;  // objects inside objects
+
+TreeNode ReadObject(IAAFObject* object, int depth);
+
+eAAFTypeCategory_t CategoryOf(IAAFTypeDef* type) {
+    eAAFTypeCategory_t category = kAAFTypeCatUnknown;
+    if (type) {
+        type->GetTypeCategory(&category);
+    }
+    return category;
+}
+
+AafRef<IAAFTypeDef> TypeOf(IAAFPropertyValue* value) {
+    AafRef<IAAFTypeDef> type;
+    value->GetType(type.Out());
+    return type;
+}
+
+// The object behind a strong reference.
+AafRef<IAAFObject> ObjectBehind(IAAFPropertyValue* value) {
+    const auto type = TypeOf(value);
+    const auto reference = As<IAAFTypeDefObjectRef>(type.get());
+    AafRef<IUnknown> target;
+    if (reference) {
+        reference->GetObject(value, IID_IUnknown, target.Out());
+    }
+    return As<IAAFObject>(target.get());
+}
+
+// Adds the objects that a property owns; false when it owns none.
+bool ReadParts(IAAFPropertyValue* value, int depth, std::vector<TreeNode>& parts) {
+    const auto type = TypeOf(value);
+    const eAAFTypeCategory_t category = CategoryOf(type.get());
+    if (category == kAAFTypeCatStrongObjRef) {
+        if (const auto object = ObjectBehind(value)) {
+            parts.push_back(ReadObject(object.get(), depth + 1));
+        }
+        return true;
+    }
+    AafRef<IAAFTypeDef> elementType;
+    AafRef<IEnumAAFPropertyValues> elements;
+    if (category == kAAFTypeCatVariableArray) {
+        const auto array = As<IAAFTypeDefVariableArray>(type.get());
+        if (array->GetType(elementType.Out()) < 0 ||
+            CategoryOf(elementType.get()) != kAAFTypeCatStrongObjRef) {
+            return false;
+        }
+        aafUInt32 count = 0;
+        array->GetCount(value, &count);
+        for (aafUInt32 i = 0; i < count; ++i) {
+            AafRef<IAAFPropertyValue> element;
+            if (array->GetElementValue(value, i, element.Out()) >= 0) {
+                ReadParts(element.get(), depth, parts);
+            }
+        }
+        return true;
+    }
+    if (category == kAAFTypeCatSet) {
+        const auto set = As<IAAFTypeDefSet>(type.get());
+        if (set->GetElementType(elementType.Out()) < 0 ||
+            CategoryOf(elementType.get()) != kAAFTypeCatStrongObjRef ||
+            set->GetElements(value, elements.Out()) < 0) {
+            return false;
+        }
+        AafRef<IAAFPropertyValue> element;
+        while (elements->NextOne(element.Out()) >= 0) {
+            ReadParts(element.get(), depth, parts);
+        }
+        return true;
+    }
+    return false;
+}
+
+TreeNode ReadObject(IAAFObject* object, int depth) {
+    TreeNode node;
+    AafRef<IAAFClassDef> definition;
+    if (object->GetDefinition(definition.Out()) >= 0) {
+        node.title =
+            TextOf(definition.get(), &IAAFClassDef::GetNameBufLen, &IAAFClassDef::GetName);
+    }
+    AafRef<IEnumAAFProperties> properties;
+    if (depth > kDeepest || object->GetProperties(properties.Out()) < 0) {
+        return node;
+    }
+    AafRef<IAAFProperty> property;
+    while (properties->NextOne(property.Out()) >= 0) {
+        AafRef<IAAFPropertyDef> propertyDefinition;
+        AafRef<IAAFPropertyValue> value;
+        if (property->GetDefinition(propertyDefinition.Out()) < 0 ||
+            property->GetValue(value.Out()) < 0) {
+            continue;
+        }
+        const std::string name = TextOf(propertyDefinition.get(), &IAAFPropertyDef::GetNameBufLen,
+                                        &IAAFPropertyDef::GetName);
+        if (depth > 0 && name == "ObjClass") {
+            continue;  // the title says it
+        }
+        std::vector<TreeNode> parts;
+        if (ReadParts(value.get(), depth, parts)) {
+            node.branches.push_back({name, std::move(parts)});
+        } else if (name != "ObjClass") {
+            node.facts.push_back({name, ValueText(value.get())});
+        }
+    }
+    // The order of properties is the library's affair; ours is by name.
+    std::stable_sort(node.facts.begin(), node.facts.end(),
+                     [](const auto& a, const auto& b) { return a.name < b.name; });
+    std::stable_sort(node.branches.begin(), node.branches.end(),
+                     [](const auto& a, const auto& b) { return a.name < b.name; });
+    return node;
+}
+
+// Master, file, source: told by the byte in which their ids differ.
+int PlaceOf(IAAFMob* mob) {
+    aafMobID_t id{};
+    mob->GetMobID(&id);
+    return id.instanceHigh == 0x00 ? 0 : id.instanceHigh == 0xB1 ? 1 : 2;
+}
+
+}  // namespace
+
+TreeNode ReadTree(IAAFFile* file) {
+    TreeNode root;
+    root.title = "AAF file";
+    AafRef<IAAFHeader> header;
+    AafRef<IEnumAAFMobs> enumerator;
+    if (!file || file->GetHeader(header.Out()) < 0 ||
+        header->GetMobs(nullptr, enumerator.Out()) < 0) {
+        return root;
+    }
+    std::vector<AafRef<IAAFMob>> mobs;
+    AafRef<IAAFMob> mob;
+    while (enumerator->NextOne(mob.Out()) >= 0) {
+        mobs.push_back(mob);
+    }
+    std::stable_sort(mobs.begin(), mobs.end(), [](const auto& a, const auto& b) {
+        return PlaceOf(a.get()) < PlaceOf(b.get());
+    });
+    TreeNode::Branch branch{"Mobs", {}};
+    for (const auto& each : mobs) {
+        if (const auto object = As<IAAFObject>(each.get())) {
+            branch.nodes.push_back(ReadObject(object.get(), 0));
+        }
+    }
+    root.branches.push_back(std::move(branch));
+    return root;
+}
+
+}  // namespace cliphost

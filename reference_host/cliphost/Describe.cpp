@@ -1,0 +1,77 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/Describe.h"
+
+#include <fmt/format.h>
+
+#include "host_interfaces/media/MediaContainer.h"
+#include "host_interfaces/media/PluginComponents.h"
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/MovieDiagnosis.h"
+#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+// What went wrong with a movie, and what would help.
+std::string Problem(Session& session, const std::filesystem::path& movie, NCFRESULT result) {
+    std::string text =
+        fmt::format("{}: not described: {}", host::DisplayPath(movie), ResultText(result));
+    for (const std::string& notice : session.TakeNotices()) {
+        text += "\n  the module said: " + notice;
+    }
+    const std::vector<std::string> missing = session.MissingDataFiles();
+    for (const std::string& file : missing) {
+        text += fmt::format("\n  {}: this data file is missing; put it back beside the module",
+                            file);
+    }
+    if (missing.empty()) {
+        text += "\n  " + DiagnoseMovie(movie);
+    }
+    return text;
+}
+
+void Finish(Session& session, Description& description) {
+    if (description.result < 0) {
+        description.file.Reset();
+        description.problem = Problem(session, description.movie, description.result);
+    } else {
+        session.TakeNotices();
+    }
+}
+
+}  // namespace
+
+Description DescribeMovie(Session& session, const std::filesystem::path& movie) {
+    Description description;
+    description.movie = movie;
+    const auto path = PathForModule(movie);
+    host::Ref<NMA::IMediaContainer3> container;
+    host::Ref<NMA::IAAFClips> clips;
+    NCFRESULT result = session.host().Create(NMA::CompID_QuickTimeContainer, container);
+    if (result >= 0) {
+        result = container->SetFilePath(path.get());
+    }
+    if (result >= 0) {
+        result = container->GetAAFMasterClips(clips.Out());
+    }
+    if (result >= 0) {
+        result = clips->GetMetadata(0, description.file.Out());
+    }
+    description.result = result;
+    Finish(session, description);
+    return description;
+}
+
+Description DescribeFromList(Session& session, NMA::IAAFClips* list, ncfSInt32 index,
+                             const std::filesystem::path& movie) {
+    Description description;
+    description.movie = movie;
+    description.result = list->GetMetadata(index, description.file.Out());
+    Finish(session, description);
+    return description;
+}
+
+}  // namespace cliphost

@@ -1,0 +1,114 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/MovieDiagnosis.h"
+
+#include <fmt/format.h>
+
+#include <array>
+#include <cstring>
+#include <fstream>
+#include <optional>
+#include <set>
+
+namespace cliphost {
+namespace {
+
+// What the top level of the file holds.
+struct TopLevel {
+    std::set<std::string> atoms;
+    std::string cutAtom;  // the atom that is longer than the file, if any
+    bool isFamily = false;
+};
+
+bool IsFourCharacters(const char* type) {
+    for (int i = 0; i < 4; ++i) {
+        const auto c = static_cast<unsigned char>(type[i]);
+        if (c < 0x20 || c == 0x7F) {
+            return false;
+        }
+    }
+    return true;
+}
+
+TopLevel ReadTopLevel(std::ifstream& stream, std::uint64_t size) {
+    static constexpr std::array kFamily = {"ftyp", "moov", "mdat", "wide", "free",
+                                           "skip", "pnot", "moof", "styp", "uuid"};
+    TopLevel top;
+    std::uint64_t position = 0;
+    while (position + 8 <= size && top.atoms.size() < 64) {
+        std::array<unsigned char, 16> head{};
+        stream.seekg(static_cast<std::streamoff>(position));
+        stream.read(reinterpret_cast<char*>(head.data()), 16);
+        stream.clear();
+        std::uint64_t length = 0;
+        for (int i = 0; i < 4; ++i) {
+            length = length << 8 | head[static_cast<std::size_t>(i)];
+        }
+        const char* const type = reinterpret_cast<const char*>(head.data()) + 4;
+        if (!IsFourCharacters(type)) {
+            break;
+        }
+        const std::string name(type, 4);
+        if (position == 0) {
+            for (const char* const known : kFamily) {
+                top.isFamily = top.isFamily || name == known;
+            }
+        }
+        if (length == 1) {
+            length = 0;
+            for (int i = 8; i < 16; ++i) {
+                length = length << 8 | head[static_cast<std::size_t>(i)];
+            }
+        } else if (length == 0) {
+            length = size - position;
+        }
+        top.atoms.insert(name);
+        if (length > size - position) {
+            top.cutAtom = name;
+            break;
+        }
+        if (length < 8) {
+            break;
+        }
+        position += length;
+    }
+    return top;
+}
+
+}  // namespace
+
+std::string DiagnoseMovie(const std::filesystem::path& movie) {
+    std::error_code error;
+    const std::uintmax_t size = std::filesystem::file_size(movie, error);
+    std::ifstream stream(movie, std::ios::binary);
+    if (error || !stream) {
+        return "the file can't be read; look at its permissions";
+    }
+    if (size == 0) {
+        return "the file is empty; copy it again from where it came";
+    }
+    const TopLevel top = ReadTopLevel(stream, size);
+    if (!top.isFamily) {
+        return "the file is no movie of the QuickTime family: it does not start with an atom of "
+               "one; convert it to .mov or .mp4";
+    }
+    if (top.atoms.count("moof") > 0) {
+        return "the movie is fragmented: its samples are told in pieces all over the file; remux "
+               "it, for instance with ffmpeg -i FILE -c copy -movflags +faststart NEW.mov";
+    }
+    if (top.cutAtom == "moov") {
+        return fmt::format("the movie header is cut off at {} bytes; copy the file again", size);
+    }
+    if (top.atoms.count("moov") == 0) {
+        return top.cutAtom.empty()
+                   ? "the file holds no movie header ('moov'), so nothing tells its tracks"
+                   : fmt::format("the file ends inside its '{}' atom, before any movie header; "
+                                 "copy it again",
+                                 top.cutAtom);
+    }
+    return "the movie header is there but can't be used: no video or sound track with a known "
+           "layout, a length of 0, or tables that do not fit the file; -v shows more";
+}
+
+}  // namespace cliphost

@@ -1,0 +1,38 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/Progress.h"
+
+#include <fmt/format.h>
+#include <unistd.h>
+
+#include <cstdio>
+
+namespace cliphost {
+namespace {
+
+constexpr std::size_t kWidth = 24;
+
+}  // namespace
+
+Progress::Progress(std::string what, std::size_t count)
+    : what_(std::move(what)), count_(count), shown_(count > 1 && isatty(STDERR_FILENO) != 0) {}
+
+Progress::~Progress() {
+    if (shown_) {
+        fmt::print(stderr, "\r\033[K");
+    }
+}
+
+void Progress::Step(const std::string& name) {
+    if (!shown_) {
+        return;
+    }
+    const std::size_t filled = kWidth * done_ / count_;
+    ++done_;
+    fmt::print(stderr, "\r\033[K{} [{}{}] {}/{} {}", what_, std::string(filled, '#'),
+               std::string(kWidth - filled, '.'), done_, count_, name);
+    std::fflush(stderr);
+}
+
+}  // namespace cliphost

@@ -1,0 +1,52 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "reference_host/cliphost/AafLibrary.h"
+#include "reference_host/framework/Host.h"
+
+namespace cliphost {
+
+// What the command line says for all verbs.
+struct SessionOptions {
+    std::filesystem::path programFolder;  // where module and library lie
+    std::filesystem::path plugin;         // empty: beside the program
+    std::filesystem::path aafLibrary;     // empty: beside the program
+    host::HostOptions host;
+    std::string pinTime;  // ISO 8601, empty: the clock
+    int verbosity = 0;
+};
+
+// A host with all its services and the module loaded into it.
+class Session {
+public:
+    explicit Session(const SessionOptions& options);  // throws a Failure
+    ~Session();
+
+    host::Host& host() { return *host_; }
+    const host::PluginModule& plugin() const { return *plugin_; }
+    const AafLibrary& aaf() const { return *aaf_; }
+
+    // Lines that the module wrote for the user since the last call.
+    std::vector<std::string> TakeNotices();
+    // Files that the module needs beside it and that are not there.
+    std::vector<std::string> MissingDataFiles() const;
+
+private:
+    std::vector<std::string> notices_;
+    std::unique_ptr<AafLibrary> aaf_;
+    std::unique_ptr<host::Host> host_;
+    host::PluginModule* plugin_ = nullptr;
+};
+
+// A path as the module wants it: absolute, with backslashes. Throws a Failure
+// for one that does not exist or that holds a backslash of its own.
+host::Ref<host::String> PathForModule(const std::filesystem::path& path);
+
+}  // namespace cliphost

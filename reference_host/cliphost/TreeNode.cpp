@@ -1,0 +1,59 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/TreeNode.h"
+
+#include <fmt/format.h>
+
+#include <nlohmann/json.hpp>
+
+namespace cliphost {
+namespace {
+
+nlohmann::ordered_json JsonOf(const TreeNode& node) {
+    nlohmann::ordered_json json;
+    json["class"] = node.title;
+    for (const TreeNode::Fact& fact : node.facts) {
+        json[fact.name] = fact.value;
+    }
+    for (const TreeNode::Branch& branch : node.branches) {
+        nlohmann::ordered_json list = nlohmann::ordered_json::array();
+        for (const TreeNode& child : branch.nodes) {
+            list.push_back(JsonOf(child));
+        }
+        json[branch.name] = std::move(list);
+    }
+    return json;
+}
+
+void Write(const TreeNode& node, int indent, std::string& out) {
+    const std::string margin(static_cast<std::size_t>(indent) * 2, ' ');
+    out += margin + node.title + "\n";
+    std::size_t widest = 0;
+    for (const TreeNode::Fact& fact : node.facts) {
+        widest = std::max(widest, fact.name.size());
+    }
+    for (const TreeNode::Fact& fact : node.facts) {
+        out += fmt::format("{}  {:<{}}  {}\n", margin, fact.name, widest, fact.value);
+    }
+    for (const TreeNode::Branch& branch : node.branches) {
+        out += fmt::format("{}  {}:\n", margin, branch.name);
+        for (const TreeNode& child : branch.nodes) {
+            Write(child, indent + 2, out);
+        }
+    }
+}
+
+}  // namespace
+
+std::string ToText(const TreeNode& node, int indent) {
+    std::string out;
+    Write(node, indent, out);
+    return out;
+}
+
+std::string ToJson(const TreeNode& node, int indent) {
+    return JsonOf(node).dump(indent, ' ', false, nlohmann::json::error_handler_t::replace);
+}
+
+}  // namespace cliphost

@@ -1,0 +1,33 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+#include <vector>
+
+namespace cliphost {
+
+// A piece of a description for people and programs: a title, named facts and
+// what it contains.
+struct TreeNode {
+    struct Fact {
+        std::string name;
+        std::string value;
+    };
+
+    std::string title;
+    std::vector<Fact> facts;
+    // Named lists of parts; the name is the property that holds them.
+    struct Branch {
+        std::string name;
+        std::vector<TreeNode> nodes;
+    };
+    std::vector<Branch> branches;
+};
+
+// Indented lines, one for each fact.
+std::string ToText(const TreeNode& node, int indent = 0);
+// The same as JSON text.
+std::string ToJson(const TreeNode& node, int indent = 2);
+
+}  // namespace cliphost

@@ -1,0 +1,18 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <CLI/CLI.hpp>
+
+#include "reference_host/cliphost/Session.h"
+
+namespace cliphost {
+
+// Each verb adds itself to the command line. It keeps its own options, and what
+// it does runs once the whole line is read; `status` becomes the exit status.
+void AddScan(CLI::App& app, const SessionOptions& session, int& status);
+void AddDescribe(CLI::App& app, const SessionOptions& session, int& status);
+void AddTypes(CLI::App& app, const SessionOptions& session, int& status);
+void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
+
+}  // namespace cliphost
