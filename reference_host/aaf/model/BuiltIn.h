@@ -93,5 +93,6 @@ Span<BuiltInDefinition> BuiltInContainerDefinitions();
 // Null when not built in.
 const BuiltInClass* FindBuiltInClass(const GUID& id);
 const BuiltInType* FindBuiltInType(const GUID& id);
+const BuiltInProperty* FindBuiltInProperty(const GUID& id);
 
 }  // namespace aaf

@@ -67,8 +67,13 @@ public:
     void KeepType(TypeDefinition& type);
     // Any registered property, by its id.
     PropertyDefinition* FindProperty(const GUID& id) const;
+    // Whether any class has a property with that id, looked up yet or not.
+    bool HasProperty(const GUID& id) const;
+    // False once all numbers are allotted.
+    bool HasFreePropertyId() const { return nextPropertyId_ >= 0x8000; }
     // By PropertyDefinitions as they come into being: their number, allotted when it is 0.
     PropertyId EnterProperty(PropertyDefinition& property);
+    void ForgetProperty(PropertyDefinition& property);
     // When reading a file whose numbers are its own: look up by id, never by number.
 
     // -- Weak references: the target of class `classId` with that id, or null.
@@ -78,6 +83,15 @@ private:
     explicit Model(const ClassRegistry& classes);
     ~Model();
     void FillDictionary();
+    ClassDefinition* AddBuiltInClass(const BuiltInClass& entry);
+    ClassDefinition& Enter(RefPtr<ClassDefinition> definition);
+    TypeDefinition& Enter(RefPtr<TypeDefinition> type);
+    // The counterparts in this model of what another model has.
+    ClassDefinition* ClassLike(const ClassDefinition& source);
+    TypeDefinition* TypeLike(const TypeDefinition& source);
+    PropertyDefinition* PropertyLike(ClassDefinition& owner, const PropertyDefinition& source);
+    void CopyReferredTo(const PropertyValue& value);
+    HRESULT CopyValue(const PropertyValue& source, Object& target, PropertyDefinition& property);
 
     const ClassRegistry& registry_;
     std::size_t pins_ = 0;

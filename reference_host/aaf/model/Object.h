@@ -77,6 +77,8 @@ public:
     // By the model, once.
     void SetClass(ClassDefinition& definition) { class_ = &definition; }
     virtual void SetDefaults() {}
+    // True for the one object that the model itself keeps, whoever contains it.
+    virtual bool BelongsToModel() const { return false; }
 
     // -- Values as they stand, ordered by number.
     const Values& values() const { return values_; }
@@ -204,6 +206,9 @@ private:
     // The definition, when it belongs to this object's class or a parent; else null.
     PropertyDefinition* OwnProperty(IAAFPropertyDef* propDef) const;
     HRESULT ReadInteger64(const PropertyKey& key, aafInt64* out) const;
+    TypeDefinition* IndirectType(const PropertyValue* value) const;
+    // The id by which a weak reference in this property names its target.
+    HRESULT WeakKey(const PropertyKey& key, IUnknown* argument, Bytes* bytes) const;
 
     ClassDefinition* class_ = nullptr;
     Object* owner_ = nullptr;

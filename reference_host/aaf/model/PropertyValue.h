@@ -37,8 +37,8 @@ public:
     Bytes& bytes() { return bytes_; }
 
     // Contained objects. They are attached to the object that this value stands in.
-    const std::vector<RefPtr<Unknown>>& objects() const { return objects_; }
-    HRESULT InsertObject(std::size_t index, Unknown* object);
+    const std::vector<RefPtr<Object>>& objects() const { return objects_; }
+    HRESULT InsertObject(std::size_t index, Object* object);
     // Takes the object out and frees it.
     void RemoveObjectAt(std::size_t index);
     void ClearObjects();
@@ -66,12 +66,12 @@ protected:
     ~PropertyValue() override;
 
 private:
-    static HRESULT Attach(Unknown& object, Object& owner);
-    static void Detach(Unknown& object);
+    static void Attach(Object& object, Object& owner);
+    static void Detach(Object& object);
 
     TypeDefinition* type_;
     Bytes bytes_;
-    std::vector<RefPtr<Unknown>> objects_;
+    std::vector<RefPtr<Object>> objects_;
     Object* holder_ = nullptr;
     std::uint64_t position_ = 0;
     std::uint8_t streamByteOrder_ = 0x55;

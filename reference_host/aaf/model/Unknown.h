@@ -4,6 +4,7 @@
 
 #include "host_interfaces/aaf/AAFResultCodes.h"
 #include "host_interfaces/aaf/AAFUnknown.h"
+#include "reference_host/aaf/model/GeneralCodes.h"
 #include "reference_host/aaf/model/NotImplemented.h"
 #include "reference_host/aaf/model/RefPtr.h"
 
