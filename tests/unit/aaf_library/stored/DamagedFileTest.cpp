@@ -175,6 +175,25 @@ TEST(DamagedFile, WithAnIndexThatClaimsTooMuchIsRefused) {
     EXPECT_EQ(refusal(fileWithIndex(0x3A, set)), "property 1901: a key of 0 bytes");
 }
 
+TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
+    ByteWriter index;
+    index.number(std::uint32_t{2}).number(std::uint64_t{0}).number(std::uint16_t{5});
+    index.number(std::uint8_t{16});
+    for (std::uint32_t i = 0; i < 2; ++i) {
+        index.number(i).number(std::uint32_t{1}).append(Bytes(16, 7));
+    }
+    const Bytes file = fileWith([&](StorageWriter& root) {
+        root.stream(u"properties", oneProperty(0x1901, 0x3A, name(u"Mobs-1901")));
+        root.stream(u"Mobs-1901 index", index.bytes());
+        for (const char16_t* element : {u"Mobs-1901{0}", u"Mobs-1901{1}"}) {
+            StorageWriter mob = root.storage(element);
+            mob.stream(u"properties", {0x4C, 0x20, 0, 0});
+            mob.close();
+        }
+    });
+    EXPECT_EQ(refusal(file), "property 1901: a set has a key twice");
+}
+
 TEST(DamagedFile, WithAWeakReferenceBeyondTheTableIsRefused) {
     Bytes reference = {7, 0, 0x01, 0x1B, 16};
     reference.resize(21);

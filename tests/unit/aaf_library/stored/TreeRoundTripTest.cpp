@@ -8,6 +8,7 @@
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>
+#include <algorithm>
 
 using namespace aaf::stored;
 
@@ -98,6 +99,21 @@ TEST_P(TreeRoundTrip, SetsAreStoredInTheOrderOfTheirKeys) {
         sample::set(0x1901, u"Mobs", {sample::keyed(1), sample::keyed(0x70), sample::keyed(0xF0)}));
     EXPECT_EQ(readTree(writeTree(mixed, GetParam())), sorted);
     EXPECT_EQ(writeTree(mixed, GetParam()), writeTree(sorted, GetParam()));
+}
+
+TEST_P(TreeRoundTrip, WeakSetsAreStoredInTheOrderOfTheirKeysAndVectorsAsTheyAre) {
+    StoredProperty weak;
+    weak.pid = 0x1E09;
+    weak.form = StoredForm::WeakSet;
+    weak.name = u"Parameters";
+    weak.keyPid = 0x1B01;
+    weak.targetPath = {2, 0x3B04};
+    weak.keys = {sample::bytes(sample::auid(9)), sample::bytes(sample::auid(3))};
+    StoredProperty sorted = weak;
+    std::reverse(sorted.keys.begin(), sorted.keys.end());
+    EXPECT_EQ(readTree(writeTree(sample::rootWith(weak), GetParam())), sample::rootWith(sorted));
+    weak.form = StoredForm::WeakVector;
+    EXPECT_EQ(readTree(writeTree(sample::rootWith(weak), GetParam())), sample::rootWith(weak));
 }
 
 TEST_P(TreeRoundTrip, PropertiesWithoutContentAreLeftOut) {

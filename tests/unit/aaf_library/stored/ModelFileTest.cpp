@@ -1,0 +1,293 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/aaf/stored/ModelFile.h"
+
+#include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDefinitionIds.h"
+#include "host_interfaces/aaf/AAFTypeIds.h"
+#include "reference_host/aaf/model/ClassDefinition.h"
+#include "reference_host/aaf/model/TypeRecord.h"
+#include "reference_host/aaf/stored/MetaPids.h"
+#include "reference_host/aaf/stored/MetaRecords.h"
+#include "reference_host/aaf/stored/ModelReader.h"
+#include "reference_host/aaf/stored/ModelWriter.h"
+#include "reference_host/aaf/stored/StoredError.h"
+#include "reference_host/aaf/stored/TreeReader.h"
+#include "reference_host/aaf/stored/TreeWriter.h"
+#include "tests/unit/aaf_library/stored/SampleModel.h"
+
+#include <gtest/gtest.h>
+#include <algorithm>
+#include <set>
+
+using namespace aaf;
+using namespace aaf::stored;
+namespace fs = std::filesystem;
+
+namespace {
+
+Bytes bytesOf(const sample::SampleModel& sample, SectorSize size = SectorSize::Bytes512) {
+    return writeTree(treeOfModel(*sample.model, *sample.header), size);
+}
+
+sample::SampleModel reread(const Bytes& file) {
+    sample::SampleModel sample;
+    sample.model = sample::newModel();
+    sample.header = readModel(readTree(file), *sample.model);
+    return sample;
+}
+
+const StoredObject& child(const StoredObject& object, std::uint16_t pid, std::size_t index = 0) {
+    const StoredProperty* property = object.find(pid);
+    if (property == nullptr || property->objects.size() <= index) {
+        throw std::logic_error("no such object");
+    }
+    return property->objects[index];
+}
+
+std::string refusal(const sample::SampleModel& sample) {
+    try {
+        treeOfModel(*sample.model, *sample.header);
+        return "";
+    } catch (const StoredError& problem) {
+        return problem.what();
+    }
+}
+
+std::set<std::u16string> storedClasses(const StoredObject& root) {
+    std::set<std::u16string> names;
+    for (const MetaClass& entry : readMetaDictionary(child(root, 1)).classes) {
+        names.insert(entry.name);
+    }
+    return names;
+}
+
+}  // namespace
+
+TEST(ModelFile, EverythingComesBackFromTheFile) {
+    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel read = reread(bytesOf(sample));
+    EXPECT_EQ(treeOfModel(*read.model, *read.header), treeOfModel(*sample.model, *sample.header));
+}
+
+TEST(ModelFile, TheSameContentGivesTheSameBytes) {
+    const sample::SampleModel sample = sample::wholeModel();
+    const Bytes first = bytesOf(sample);
+    EXPECT_EQ(bytesOf(sample), first);
+    EXPECT_EQ(bytesOf(sample::wholeModel()), first);
+    EXPECT_EQ(bytesOf(reread(first)), first);
+}
+
+TEST(ModelFile, ValuesCanBeReadAfterwards) {
+    const sample::SampleModel read = reread(bytesOf(sample::wholeModel(), SectorSize::Bytes4096));
+    ASSERT_EQ(read.header->ObjectAt(prop::Header_Content)->CountObjects(prop::ContentStorage_Mobs),
+              3u);
+    Object& file = sample::mob(*read.header, 0);
+    Object& import = sample::mob(*read.header, 1);
+    Object& master = sample::mob(*read.header, 2);
+
+    aafMobID_t id{};
+    ASSERT_GE(file.ReadStruct(prop::Mob_MobID, &id), 0);
+    EXPECT_EQ(id.material.Data4[7], 5);
+    EXPECT_EQ(master.classId(), AUID_AAFMasterMob);
+    EXPECT_EQ(master.StringOr(prop::Mob_Name, L""), L"clip \xE4 \x4E2D");
+    EXPECT_EQ(sample::slot(master, 1).StringOr(prop::MobSlot_SlotName, L"absent"), L"");
+
+    Object* second = master.ObjectAt(prop::Mob_UserComments, 1);
+    ASSERT_NE(second, nullptr);
+    EXPECT_EQ(second->StringOr(prop::TaggedValue_Name, L"absent"), L"");
+    wchar_t text[16] = {};
+    ASSERT_GE(second->ReadIndirect(prop::TaggedValue_Value, text, sizeof text), 0);
+    EXPECT_EQ(std::wstring(text), L"two \U0001F3AC");
+
+    Object* timecode = sample::slot(import, 0).ObjectAt(prop::MobSlot_Segment);
+    ASSERT_NE(timecode, nullptr);
+    EXPECT_EQ(timecode->IntegerOr(prop::Timecode_Start, 0), 86400);
+    auto* kind = dynamic_cast<Object*>(timecode->WeakTarget(prop::Component_DataDefinition));
+    ASSERT_NE(kind, nullptr);
+    EXPECT_EQ(kind->StringOr(prop::DefinitionObject_Name, L""), L"DataDef_Timecode");
+}
+
+TEST(ModelFile, ExtensionsAreKnownAndReadableAfterwards) {
+    const sample::SampleModel read = reread(bytesOf(sample::wholeModel()));
+    auto* quad = dynamic_cast<TypeRecord*>(read.model->FindType(sample::quadTypeId));
+    ASSERT_NE(quad, nullptr);
+    ASSERT_EQ(quad->members().size(), 4u);
+    EXPECT_EQ(quad->members()[3].name, L"Bottom");
+    EXPECT_EQ(quad->StoredSize(), 32u);
+
+    PropertyDefinition* area = read.model->FindProperty(sample::quadPropertyId);
+    ASSERT_NE(area, nullptr);
+    EXPECT_TRUE(area->IsOptional());
+    EXPECT_EQ(area->owner().id(), AUID_AAFDigitalImageDescriptor);
+    Object* descriptor = sample::mob(*read.header, 0).ObjectAt(prop::SourceMob_EssenceDescription);
+    Object* picture = descriptor->ObjectAt(prop::MultipleDescriptor_FileDescriptors, 0);
+    PropertyValue* value = picture->FindValue(area->key());
+    ASSERT_NE(value, nullptr);
+    EXPECT_EQ(value->bytes()[16], 128);
+
+    Object* own = descriptor->ObjectAt(prop::EssenceDescriptor_Locator, 1);
+    EXPECT_EQ(own->classId(), sample::ownClassId);
+    EXPECT_EQ(own->classDefinition().parent()->id(), AUID_AAFLocator);
+    PropertyDefinition* place = read.model->FindProperty(sample::ownPropertyId);
+    ASSERT_NE(place, nullptr);
+    EXPECT_EQ(own->FindValue(place->key())->bytes(), Bytes(24, 3));
+    EXPECT_NE(read.model->FindTarget(AUID_AAFContainerDef, sample::ownDefinitionId), nullptr);
+}
+
+// Another writer numbers its extensions as it likes.
+TEST(ModelFile, LocalNumbersOfAnotherWriterAreTranslated) {
+    StoredObject tree = [] {
+        const sample::SampleModel sample = sample::wholeModel();
+        return treeOfModel(*sample.model, *sample.header);
+    }();
+    const StoredObject original = tree;
+    const auto other = [](std::uint16_t pid) {
+        return static_cast<std::uint16_t>(pid < 0x8000 ? pid : pid - 0x1000);
+    };
+    const std::function<void(StoredObject&)> renumber = [&](StoredObject& object) {
+        for (StoredProperty& property : object.properties) {
+            property.pid = other(property.pid);
+            if (property.pid == meta::localIdentification && property.bytes[1] >= 0x80) {
+                property.bytes[1] = static_cast<std::uint8_t>(property.bytes[1] - 0x10);
+            }
+            for (StoredObject& contained : property.objects) {
+                renumber(contained);
+            }
+        }
+    };
+    renumber(tree);
+    ASSERT_NE(tree, original);
+    sample::SampleModel read;
+    read.model = sample::newModel();
+    read.header = readModel(tree, *read.model);
+    EXPECT_EQ(treeOfModel(*read.model, *read.header), original);
+}
+
+TEST(ModelFile, OnlyDefinitionsThatAreReferredToOrOwnAreStored) {
+    const sample::SampleModel sample = sample::wholeModel();
+    const StoredObject tree = treeOfModel(*sample.model, *sample.header);
+    const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
+    EXPECT_EQ(dictionary.find(prop::Dictionary_DataDefinitions.pid)->objects.size(), 3u);
+    EXPECT_EQ(dictionary.find(prop::Dictionary_ContainerDefinitions.pid)->objects.size(), 2u);
+    EXPECT_EQ(dictionary.find(prop::Dictionary_OperationDefinitions.pid), nullptr);
+}
+
+TEST(ModelFile, TheMetaDictionaryHoldsWhatIsUsedAndIsClosed) {
+    const sample::SampleModel sample = sample::wholeModel();
+    const StoredObject tree = treeOfModel(*sample.model, *sample.header);
+    const MetaRecords records = readMetaDictionary(child(tree, 1));
+    const std::set<std::u16string> names = storedClasses(tree);
+    for (const char16_t* name : {u"SourceMob", u"CDCIDescriptor", u"ExampleLocator", u"Timecode",
+                                 u"ClassDefinition", u"TypeDefinitionRecord", u"MetaDictionary",
+                                 u"PropertyDefinition", u"Header", u"DataDefinition"}) {
+        EXPECT_EQ(names.count(name), 1u) << toUtf8(name);
+    }
+    EXPECT_EQ(names.count(u"RGBADescriptor"), 0u);
+    EXPECT_EQ(names.count(u"MPEGVideoDescriptor"), 0u);
+
+    std::set<StoredAuid> classes;
+    std::set<StoredAuid> types;
+    for (const MetaClass& entry : records.classes) {
+        classes.insert(storedAuid(entry.id));
+    }
+    for (const MetaType& entry : records.types) {
+        types.insert(storedAuid(entry.id));
+    }
+    for (const MetaClass& entry : records.classes) {
+        EXPECT_EQ(classes.count(storedAuid(entry.parent)), 1u) << toUtf8(entry.name);
+        for (const MetaProperty& property : entry.properties) {
+            EXPECT_EQ(types.count(storedAuid(property.type)), 1u) << toUtf8(property.name);
+        }
+    }
+    for (const MetaType& entry : records.types) {
+        const bool isReference =
+            entry.kind == TypeKind::StrongReference || entry.kind == TypeKind::WeakReference;
+        if (entry.target != GUID{}) {
+            EXPECT_EQ((isReference ? classes : types).count(storedAuid(entry.target)), 1u)
+                << toUtf8(entry.name);
+        }
+        for (const MetaMember& member : entry.members) {
+            if (entry.kind == TypeKind::Record) {
+                EXPECT_EQ(types.count(storedAuid(member.id)), 1u) << toUtf8(entry.name);
+            }
+        }
+    }
+}
+
+TEST(ModelFile, RequiredCollectionsAreStoredEmpty) {
+    const sample::SampleModel sample = sample::emptyModel();
+    const StoredObject tree = treeOfModel(*sample.model, *sample.header);
+    const StoredObject& content = child(child(tree, 2), prop::Header_Content.pid);
+    for (const PropertyKey& key : {prop::ContentStorage_Mobs, prop::ContentStorage_EssenceData}) {
+        const StoredProperty* set = content.find(key.pid);
+        ASSERT_NE(set, nullptr);
+        EXPECT_TRUE(set->objects.empty());
+        EXPECT_EQ(set->keySize, 32);
+    }
+    EXPECT_EQ(content.find(prop::ContentStorage_Mobs.pid)->keyPid, prop::Mob_MobID.pid);
+    EXPECT_EQ(content.find(prop::ContentStorage_EssenceData.pid)->keyPid,
+              prop::EssenceData_MobID.pid);
+}
+
+TEST(ModelFile, ASlotWithoutSegmentIsRefused) {
+    const sample::SampleModel sample = sample::wholeModel();
+    Object& slot = sample::slot(sample::mob(*sample.header, 0), 0);
+    ASSERT_GE(slot.RemoveValue(prop::MobSlot_Segment), 0);
+    EXPECT_EQ(refusal(sample), "Content: Mobs: Slots: TimelineMobSlot has no Segment");
+}
+
+TEST(ModelFile, ASourceMobWithoutDescriptorIsRefused) {
+    const sample::SampleModel sample = sample::wholeModel();
+    ASSERT_GE(sample::mob(*sample.header, 0).RemoveValue(prop::SourceMob_EssenceDescription), 0);
+    EXPECT_EQ(refusal(sample), "Content: Mobs: SourceMob has no EssenceDescription");
+}
+
+TEST(ModelFile, ADefinitionThatTheDictionaryLacksIsRefused) {
+    const sample::SampleModel sample = sample::wholeModel();
+    Object& import = sample::mob(*sample.header, 1);
+    Object* timecode = sample::slot(import, 0).ObjectAt(prop::MobSlot_Segment);
+    timecode->FindValue(prop::Component_DataDefinition)->bytes()[0] ^= 0xFF;
+    EXPECT_EQ(refusal(sample),
+              "a definition that is referred to is not in the dictionary (property 2605)");
+}
+
+TEST(ModelFile, AFileKeepsWhatItSaysOfABuiltInDefinition) {
+    const sample::SampleModel sample = sample::wholeModel();
+    auto* picture =
+        dynamic_cast<Object*>(sample.model->FindTarget(AUID_AAFDataDef, kAAFDataDef_Picture));
+    ASSERT_GE(picture->PutString(prop::DefinitionObject_Description, L"moving"), 0);
+    const sample::SampleModel read = reread(bytesOf(sample));
+    auto* again =
+        dynamic_cast<Object*>(read.model->FindTarget(AUID_AAFDataDef, kAAFDataDef_Picture));
+    EXPECT_EQ(again->StringOr(prop::DefinitionObject_Description, L""), L"moving");
+    EXPECT_EQ(read.model->dictionary().CountObjects(prop::Dictionary_DataDefinitions), 11u);
+}
+
+TEST(ModelFile, SavesAndLoadsByPathAndNamesThePathInErrors) {
+    const fs::path folder = fs::path(testing::TempDir()) / "model_file_test";
+    fs::create_directories(folder);
+    const sample::SampleModel sample = sample::wholeModel();
+    for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
+        const FileResult saved = saveModel(*sample.model, *sample.header, folder / "a.aaf", size);
+        ASSERT_TRUE(saved) << saved.message;
+        const RefPtr<Model> model = sample::newModel();
+        RefPtr<Object> header;
+        const FileResult loaded = loadModel(folder / "a.aaf", *model, header);
+        ASSERT_TRUE(loaded) << loaded.message;
+        ASSERT_TRUE(header);
+    }
+    ASSERT_GE(sample::mob(*sample.header, 0).RemoveValue(prop::SourceMob_EssenceDescription), 0);
+    const FileResult refused =
+        saveModel(*sample.model, *sample.header, folder / "b.aaf", SectorSize::Bytes512);
+    EXPECT_EQ(refused.failure, FileFailure::NotStorable);
+    EXPECT_EQ(refused.message, (folder / "b.aaf").u8string() +
+                                   ": Content: Mobs: SourceMob has no EssenceDescription");
+    EXPECT_FALSE(fs::exists(folder / "b.aaf"));
+
+    const RefPtr<Model> model = sample::newModel();
+    RefPtr<Object> header;
+    EXPECT_EQ(loadModel(folder / "absent.aaf", *model, header).failure, FileFailure::NotThere);
+    EXPECT_FALSE(header);
+    fs::remove_all(folder);
+}

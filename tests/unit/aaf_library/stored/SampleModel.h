@@ -1,0 +1,43 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "reference_host/aaf/model/Dictionary.h"
+#include "reference_host/aaf/model/Model.h"
+
+#include <string>
+
+// A model with a header that has everything a description of a movie file may
+// have: mobs of both kinds, slots, a sequence, source clips, a timecode,
+// descriptors within one another, locators, comments, a container, an
+// extension record type with optional properties on an existing class, and a
+// class of its own.
+
+namespace aaf::stored::sample {
+
+inline constexpr GUID quadTypeId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E01");
+inline constexpr GUID quadPropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E02");
+inline constexpr GUID notePropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E03");
+inline constexpr GUID ownClassId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E04");
+inline constexpr GUID ownPropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E05");
+inline constexpr GUID ownDefinitionId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E06");
+
+RefPtr<Model> newModel();
+
+struct SampleModel {
+    RefPtr<Model> model;
+    RefPtr<Object> header;
+};
+
+SampleModel wholeModel();
+
+// The parts of a model that is known to look like the sample.
+Object& mob(Object& header, std::size_t index);
+Object& slot(Object& mob, std::size_t index);
+
+// A header with an empty content storage.
+SampleModel emptyModel();
+
+aafMobID_t mobId(std::uint8_t last);
+
+}  // namespace aaf::stored::sample
