@@ -3,8 +3,10 @@
 #include "reference_host/aaf/stored/ModelReader.h"
 
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "reference_host/aaf/model/ClassDefinition.h"
 #include "reference_host/aaf/model/Dictionary.h"
 #include "reference_host/aaf/model/Model.h"
+#include "reference_host/aaf/model/TypeDefinition.h"
 #include "reference_host/aaf/stored/MetaPids.h"
 #include "reference_host/aaf/stored/MetaRegistration.h"
 #include "reference_host/aaf/stored/ModelNames.h"
@@ -33,6 +35,7 @@ public:
         mergeDictionary(contained(from, prop::Header_Dictionary.pid, "dictionary"));
         RefPtr<Object> header = newObject(from, AUID_AAFHeader);
         fill(*header, from, prop::Header_Dictionary.id);
+        header->PutObject(prop::Header_Dictionary, model_.dictionary().Identity());
         if (header->ObjectAt(prop::Header_Content) == nullptr) {
             throw StoredError("has no content");
         }

@@ -14,8 +14,8 @@ namespace aaf::stored {
 
 // Brings the tree of a file into a model, which should be new: definitions
 // that the model lacks are registered, those of the file's dictionary join the
-// model's, and the header comes back with everything in it but the dictionary,
-// which is the model's. Properties are told by their ids, so the file's own
+// model's, and the header comes back with everything in it; its dictionary is
+// the model's. Properties are told by their ids, so the file's own
 // numbers do not matter. Values that nothing describes are passed over.
 // Throws StoredError; the model then is of no further use.
 RefPtr<Object> readModel(const StoredObject& root, Model& model);

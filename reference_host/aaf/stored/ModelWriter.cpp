@@ -3,8 +3,10 @@
 #include "reference_host/aaf/stored/ModelWriter.h"
 
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "reference_host/aaf/model/ClassDefinition.h"
 #include "reference_host/aaf/model/Dictionary.h"
 #include "reference_host/aaf/model/Model.h"
+#include "reference_host/aaf/model/TypeDefinition.h"
 #include "reference_host/aaf/stored/MetaClosure.h"
 #include "reference_host/aaf/stored/MetaPids.h"
 #include "reference_host/aaf/stored/ModelNames.h"

@@ -12,6 +12,7 @@
 #include "reference_host/aaf/stored/ModelReader.h"
 #include "reference_host/aaf/stored/ModelWriter.h"
 #include "reference_host/aaf/stored/StoredError.h"
+#include "reference_host/aaf/stored/StoredNames.h"
 #include "reference_host/aaf/stored/TreeReader.h"
 #include "reference_host/aaf/stored/TreeWriter.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
