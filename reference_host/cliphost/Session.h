@@ -10,6 +10,7 @@
 
 #include "reference_host/cliphost/AafLibrary.h"
 #include "reference_host/framework/Host.h"
+#include "reference_host/framework/String.h"
 
 namespace cliphost {
 

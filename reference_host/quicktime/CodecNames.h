@@ -1,0 +1,17 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+
+#include "host_interfaces/framework/ResultCodes.h"
+
+namespace host {
+
+// A person's name for a codec, from the four-character code of a sample
+// description with the first character in the top byte. Empty with NCF_OK for a
+// well-formed code that nobody knows; NCF_E_INVALIDARG for code 0 and for codes
+// that are not printable.
+NCFRESULT CodecName(ncfUInt32 code, std::string& name);
+
+}  // namespace host

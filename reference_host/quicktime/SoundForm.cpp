@@ -1,0 +1,104 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/quicktime/SoundForm.h"
+
+extern "C" {
+#include <libavcodec/codec_desc.h>
+#include <libavutil/avutil.h>
+}
+
+#include <string_view>
+
+namespace host {
+namespace {
+
+constexpr ncfUInt32 Code(const char (&text)[5]) {
+    return static_cast<ncfUInt32>(static_cast<unsigned char>(text[0])) << 24 |
+           static_cast<ncfUInt32>(static_cast<unsigned char>(text[1])) << 16 |
+           static_cast<ncfUInt32>(static_cast<unsigned char>(text[2])) << 8 |
+           static_cast<ncfUInt32>(static_cast<unsigned char>(text[3]));
+}
+
+constexpr ncfUInt32 kFloat = 1;
+constexpr ncfUInt32 kBigEndian = 2;
+constexpr ncfUInt32 kSigned = 4;
+constexpr ncfUInt32 kPacked = 8;
+
+constexpr double kHighestRate = 1e9;
+constexpr int kMostChannels = 0xFFFF;
+
+// Codes of compressed sound. Sound that is not listed goes by its own tag.
+struct CompressedRow {
+    AVCodecID codec;
+    ncfUInt32 formatId;
+};
+constexpr CompressedRow kCompressed[] = {
+    {AV_CODEC_ID_AAC, Code("aac ")},       {AV_CODEC_ID_AC3, Code("ac-3")},
+    {AV_CODEC_ID_EAC3, Code("ec-3")},      {AV_CODEC_ID_MP3, Code(".mp3")},
+    {AV_CODEC_ID_MP2, Code(".mp2")},       {AV_CODEC_ID_MP1, Code(".mp1")},
+    {AV_CODEC_ID_ALAC, Code("alac")},      {AV_CODEC_ID_PCM_ALAW, Code("alaw")},
+    {AV_CODEC_ID_PCM_MULAW, Code("ulaw")}, {AV_CODEC_ID_ADPCM_IMA_QT, Code("ima4")},
+    {AV_CODEC_ID_OPUS, Code("opus")},      {AV_CODEC_ID_FLAC, Code("flac")},
+};
+
+// Linear sound is told by the name of its kind: sign, bits and byte order.
+bool ReadLinearKind(AVCodecID codec, SoundForm& form) {
+    const std::string_view name = avcodec_get_name(codec);
+    if (name.substr(0, 4) != "pcm_" || name.size() < 6) {
+        return false;
+    }
+    const char kind = name[4];
+    if ((kind != 's' && kind != 'u' && kind != 'f') || name[5] < '0' || name[5] > '9') {
+        return false;  // a-law and the like are compressed
+    }
+    form.bitsPerChannel = static_cast<ncfUInt32>(av_get_bits_per_sample(codec));
+    form.isBigEndian = name.find("be") != std::string_view::npos;
+    form.formatFlags = kPacked | (kind == 'f' ? kFloat : kind == 's' ? kSigned : 0u) |
+                       (form.isBigEndian ? kBigEndian : 0u);
+    return form.bitsPerChannel > 0;
+}
+
+ncfUInt32 FormatIdOf(const AVCodecParameters& parameters) {
+    for (const CompressedRow& row : kCompressed) {
+        if (row.codec == parameters.codec_id) {
+            return row.formatId;
+        }
+    }
+    const ncfUInt32 tag = parameters.codec_tag;  // first character in the low byte
+    return tag << 24 | (tag & 0xFF00u) << 8 | (tag >> 8 & 0xFF00u) | tag >> 24;
+}
+
+}  // namespace
+
+bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
+    const AVCodecParameters& parameters = *stream.codecpar;
+    const int channels = parameters.ch_layout.nb_channels;
+    if (parameters.codec_type != AVMEDIA_TYPE_AUDIO || channels < 1 || channels > kMostChannels ||
+        parameters.sample_rate < 1 || parameters.sample_rate > kHighestRate) {
+        return false;
+    }
+    SoundForm form;
+    form.channels = static_cast<ncfUInt32>(channels);
+    form.sampleRate = parameters.sample_rate;
+    if (ReadLinearKind(parameters.codec_id, form)) {
+        form.formatId = Code("lpcm");
+        form.bytesPerPacket = form.channels * ((form.bitsPerChannel + 7) / 8);
+        form.framesPerPacket = 1;
+        form.isConstantBitRate = true;
+    } else {
+        form.formatId = FormatIdOf(parameters);
+        // Only kinds whose packets all have one size tell a size here.
+        const bool constant = av_get_bits_per_sample(parameters.codec_id) > 0;
+        form.bytesPerPacket =
+            constant ? static_cast<ncfUInt32>(parameters.block_align > 0 ? parameters.block_align
+                                                                         : 0)
+                     : 0;
+        form.framesPerPacket =
+            parameters.frame_size > 0 ? static_cast<ncfUInt32>(parameters.frame_size) : 0;
+    }
+    out = form;
+    return true;
+}
+
+}  // namespace host
