@@ -1,0 +1,83 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+
+#include "host_interfaces/util/NMAUtil.h"
+#include "reference_host/framework/Ref.h"
+#include "reference_host/xml/SaxParser.h"
+#include "source/descriptor_data/IGenericDocHandler.h"
+#include "source/plugin/CNCFUnknown.h"
+#include "source/plugin/CreationFunctions.h"
+#include "source/plugin/PluginFolder.h"
+#include "tests/support/fakes/RecordingLogger.h"
+#include "tests/unit/descriptor_data/FakeSaxParser.h"
+
+// A host in which data files can be read: strings, the module's own document
+// handler, and either a scripted parser or the reference host's.
+class DataHost : public ::testing::Test {
+protected:
+    DataHost() {
+        EXPECT_GE(NMAInitialize(host.factory()), 0);
+        host.name(kCLSID_SaxParser, "parser");
+        host.name(kCLSID_GenericDocHandler, "handler");
+        host.name(NCFCompID_NCFString, "string");
+        host.maker(kCLSID_GenericDocHandler, [this](const GUID& iid, void** out) {
+            return NMA::Impl::CreateGenericDocHandler(host.unknown(), nullptr, iid, out);
+        });
+        UseHostParser();
+        folder_ = std::filesystem::path(::testing::TempDir()) /
+                  (std::string("descriptor_data_") +
+                   ::testing::UnitTest::GetInstance()->current_test_info()->name() + "_" +
+                   std::to_string(reinterpret_cast<std::uintptr_t>(this)));
+        std::filesystem::create_directories(folder_);
+    }
+    ~DataHost() override {
+        SetPluginFolder(nullptr);
+        std::filesystem::remove_all(folder_);
+        NMATerminate();
+        EXPECT_EQ(GetObjectCount(), 0u) << "components of the module are left";
+    }
+
+    void UseHostParser() {
+        host.maker(kCLSID_SaxParser, [](const GUID& iid, void** out) {
+            return host::MakeRef<host::SaxParser>()->QueryInterface(iid, out);
+        });
+    }
+    void UseScript() {
+        host.maker(kCLSID_SaxParser, [this](const GUID& iid, void** out) {
+            auto* const parser = new FakeSaxParser(script, &journal);
+            const NCFRESULT result = parser->QueryInterface(iid, out);
+            parser->Release();
+            return result;
+        });
+    }
+
+    // A file in the test's own folder; gives its path.
+    std::string Write(const std::string& name, const std::string& text) {
+        const std::filesystem::path path = folder_ / name;
+        std::ofstream(path, std::ios::binary) << text;
+        return path.string();
+    }
+    std::string Folder() const { return folder_.string() + "/"; }
+    // Makes the test's own folder the module's.
+    void MakeItTheModulesFolder() { SetModulesFolder(Folder()); }
+    static void SetModulesFolder(const std::string& folder) {
+        INCFString* const text = MakeHostString(folder);
+        SetPluginFolder(text);
+        text->Release();
+    }
+
+    Journal journal;
+    FakeHost host{&journal};
+    RecordingLog log{host};
+    FakeSaxParser::Script script;
+
+private:
+    std::filesystem::path folder_;
+};
