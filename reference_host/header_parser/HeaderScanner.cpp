@@ -197,11 +197,12 @@ Verdict HeaderScanner::GatherToEnd(Range& range) {
         walked_ += childSize;
         childSize = 0;
     }
-    // One byte that is there already goes along, so that the read does not
-    // fail when the file ends exactly here.
+    // What is behind the last whole child may be the end of the file already, so
+    // the read begins with the child's last byte, which is there.
     const ncfUInt64 known = payload_.Size() - walked_;
     const ncfUInt64 missing = childSize > known ? childSize - known : 0;
-    return Want(cursor_ - 1, std::max<ncfUInt64>(missing + 1, limits_.scanReadSize));
+    const ncfUInt64 back = missing > 0 ? 0 : known + 1;
+    return Want(cursor_ - back, std::max<ncfUInt64>(missing, limits_.scanReadSize));
 }
 
 Verdict HeaderScanner::Finish() {

@@ -40,7 +40,7 @@ private:
     ncfUInt32 passes_ = 0;
 };
 
-// A small sound movie: 30 frames of video in chunks of 10, at 30 frames a
+// A small movie without a defect: 30 frames of video in chunks of 10, at 30 frames a
 // second, movie time scale 600.
 movies::Movie PlainMovie();
 

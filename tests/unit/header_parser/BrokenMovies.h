@@ -1,0 +1,22 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "host_interfaces/framework/ResultCodes.h"
+#include "tests/support/movies/Movie.h"
+
+// A file with one defect. The name says which; the fuzzer's corpus keeps the
+// file under it.
+struct BrokenMovie {
+    std::string name;
+    movies::Bytes bytes;
+    NCFRESULT expected;
+};
+
+std::vector<BrokenMovie> BrokenMovies();
+
+// Movies of many kinds without a defect, likewise named.
+std::vector<BrokenMovie> WholeMovies();

@@ -1,0 +1,210 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <gtest/gtest.h>
+
+#include "tests/unit/header_parser/ParsedMovie.h"
+
+namespace {
+
+using movies::Box;
+using movies::Movie;
+using movies::Track;
+
+Movie WithTrack(const Track& track) {
+    Movie movie;
+    movie.tracks = {track};
+    return movie;
+}
+
+TEST(Track, IsReadInBothHeaderVersions) {
+    for (const unsigned version : {0u, 1u}) {
+        Movie movie = PlainMovie();
+        movie.tracks[0].headerVersion = version;
+        movie.tracks[0].id = 77;
+        movie.tracks[0].mediaDuration = 31;
+        movie.tracks[0].trackDuration = 601;
+        movie.tracks[0].matrix = movies::kRotated90;
+        const auto track = ParsedMovie(movie).Video();
+        ASSERT_TRUE(track);
+        EXPECT_EQ(Ask(track, &ITrackInfo::GetTrackId), 77u);
+        EXPECT_EQ(Ask(track, &ITrackInfo::GetTrackDuration), 601u);
+        EXPECT_EQ(Ask(track, &ITrackInfo::GetMediaTS), 30u);
+        EXPECT_EQ(Ask(track, &ITrackInfo::GetMediaDuration), 31u);
+        float matrix[9] = {};
+        ASSERT_EQ(track->GetTrackMatrix(matrix), NCF_OK);
+        for (std::size_t i = 0; i < 9; ++i) {
+            EXPECT_FLOAT_EQ(matrix[i], static_cast<float>(movies::kRotated90[i])) << i;
+        }
+    }
+}
+
+TEST(Track, GivesEachDisplayMatrixRowByRow) {
+    for (const movies::Matrix& expected :
+         {movies::kIdentity, movies::kRotated180, movies::kRotated270,
+          movies::Matrix{0.5, 0.25, 0, -1.5, 2, 0, 100, -20, 1}}) {
+        Movie movie = PlainMovie();
+        movie.tracks[0].matrix = expected;
+        float matrix[9] = {};
+        ASSERT_EQ(ParsedMovie(movie).Video()->GetTrackMatrix(matrix), NCF_OK);
+        for (std::size_t i = 0; i < 9; ++i) {
+            EXPECT_FLOAT_EQ(matrix[i], static_cast<float>(expected[i])) << i;
+        }
+    }
+}
+
+TEST(Track, DerivesAnUnknownMediaDurationFromItsSamples) {
+    for (const unsigned version : {0u, 1u}) {
+        for (const ncfUInt64 unknown :
+             {ncfUInt64{0}, version == 1 ? ~ncfUInt64{0} : ncfUInt64{0xFFFFFFFF}}) {
+            Movie movie = PlainMovie();
+            movie.tracks[0].headerVersion = version;
+            movie.tracks[0].mediaDuration = unknown;
+            EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetMediaDuration), 30u);
+        }
+    }
+}
+
+TEST(Track, DerivesAnUnknownDurationFromItsMedia) {
+    for (const ncfUInt64 unknown : {ncfUInt64{0}, ncfUInt64{0xFFFFFFFF}}) {
+        Movie movie = PlainMovie();
+        movie.tracks[0].trackDuration = unknown;
+        EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetTrackDuration), 600u);
+    }
+}
+
+TEST(Track, HasTheDurationOfItsEdits) {
+    Movie movie = PlainMovie();
+    movie.tracks[0].edits = {{100, -1, 1.0}, {300, 0, 1.0}};
+    movie.tracks[0].trackDuration = 999;
+    EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetTrackDuration), 400u);
+}
+
+TEST(Track, HasItsHeadersDurationWhereTheEditLeavesItOpen) {
+    Movie movie = PlainMovie();
+    movie.tracks[0].edits = {{0, 2, 1.0}};
+    movie.tracks[0].trackDuration = 555;
+    EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetTrackDuration), 555u);
+}
+
+TEST(Track, IsSortedByItsHandler) {
+    Movie movie;
+    movie.tracks = {movies::OtherTrack("text", 1, 600, 600),
+                    PlainMovie().tracks[0],
+                    movies::SoundTrack(movies::SoundFormat(), 4800),
+                    movies::TimecodeTrack(movies::TimecodeFormat(), 0, 25),
+                    movies::OtherTrack("meta", 1, 600, 600),
+                    PlainMovie().tracks[0]};
+    const ParsedMovie parsed(movie);
+    ASSERT_EQ(parsed.Result(), NCF_OK) << parsed.Reason();
+    EXPECT_EQ(Ask(&parsed.Parser(), &IQTParser::GetVideoTrackCount), 2u);
+    EXPECT_EQ(Ask(&parsed.Parser(), &IQTParser::GetAudioTrackCount), 1u);
+    EXPECT_EQ(Ask(&parsed.Parser(), &IQTParser::GetTimeCodeTrackCount), 1u);
+    EXPECT_EQ(Ask(&parsed.Parser(), &IQTParser::GetOtherTrackCount), 2u);
+    EXPECT_EQ(Ask(parsed.Video(0), &ITrackInfo::GetTrackId), 2u);
+    EXPECT_EQ(Ask(parsed.Video(1), &ITrackInfo::GetTrackId), 6u);
+    EXPECT_EQ(Ask(parsed.Sound(0), &ITrackInfo::GetTrackId), 3u);
+    EXPECT_EQ(Ask(parsed.Timecode(0), &ITrackInfo::GetTrackId), 4u);
+    EXPECT_EQ(Ask(parsed.Other(0), &ITrackInfo::GetTrackId), 1u);
+    EXPECT_EQ(Ask(parsed.Other(1), &ITrackInfo::GetTrackId), 5u);
+}
+
+TEST(Track, WithoutHandlerGoesByItsMediaHeader) {
+    Track video = PlainMovie().tracks[0];
+    video.omitted = {"hdlr"};
+    EXPECT_TRUE(ParsedMovie(WithTrack(video)).Video());
+    Track sound = movies::SoundTrack(movies::SoundFormat(), 4800);
+    sound.omitted = {"hdlr"};
+    EXPECT_TRUE(ParsedMovie(WithTrack(sound)).Sound());
+}
+
+TEST(Track, MayHaveTheNumberOfAnother) {
+    Movie movie = PlainMovie();
+    movie.tracks.push_back(movie.tracks[0]);
+    movie.tracks[0].id = movie.tracks[1].id = 5;
+    const ParsedMovie parsed(movie);
+    ASSERT_EQ(parsed.Result(), NCF_OK);
+    EXPECT_EQ(Ask(parsed.Video(1), &ITrackInfo::GetTrackId), 5u);
+}
+
+TEST(Track, CountsItsDescriptionsAndGivesEach) {
+    movies::VideoFormat first;
+    movies::VideoFormat second;
+    first.codec = "apcn";
+    second.codec = "apch";
+    Movie movie = PlainMovie();
+    movie.tracks[0].descriptions = {first.ToBox(), second.ToBox()};
+    const ParsedMovie parsed(movie);
+    EXPECT_EQ(Ask(parsed.Video(), &ITrackInfo::GetSampleDescriptionCount), 2u);
+    EXPECT_EQ(Ask(parsed.VideoDescription(0), &IVideoSampleDescription::GetDataFormat),
+              movies::Code("apcn"));
+    EXPECT_EQ(Ask(parsed.VideoDescription(1), &IVideoSampleDescription::GetDataFormat),
+              movies::Code("apch"));
+    IVideoSampleDescription* none = reinterpret_cast<IVideoSampleDescription*>(8);
+    EXPECT_EQ(parsed.Video()->GetVideoSampleDescription(2, &none), NCF_E_NOTFOUND);
+    EXPECT_EQ(none, nullptr);
+}
+
+TEST(Track, MayHaveNoSamplesAndNoDescriptions) {
+    Movie movie = PlainMovie();
+    movie.tracks[0].samples.clear();
+    movie.tracks[0].descriptions.clear();
+    const ParsedMovie parsed(movie);
+    ASSERT_EQ(parsed.Result(), NCF_OK) << parsed.Reason();
+    EXPECT_EQ(Ask(parsed.Samples(), &IQTSampleTable::GetNumSamples), 0u);
+    EXPECT_EQ(Ask(parsed.Samples(), &IQTSampleTable::GetMaxDataSizeInBytes), 0u);
+    EXPECT_EQ(Ask(parsed.Video(), &ITrackInfo::GetSampleDescriptionCount), 0u);
+    ncfUInt64 position = 0, size = 0;
+    EXPECT_EQ(parsed.Samples()->GetChunkFromTheMiddle(&position, &size), NMA_E_NODATA);
+}
+
+TEST(Track, NeedsNoDataReferencesToBeInItsOwnFile) {
+    Movie movie = PlainMovie();
+    movie.tracks[0].omitted = {"dinf"};
+    EXPECT_EQ(Ask(&ParsedMovie(movie).Parser(), &IQTParser::IsMovieSelfContained), 1);
+    movies::VideoFormat format;
+    format.dataReference = 0;
+    movie.tracks[0].omitted.clear();
+    movie.tracks[0].descriptions = {format.ToBox()};
+    EXPECT_EQ(Ask(&ParsedMovie(movie).Parser(), &IQTParser::IsMovieSelfContained), 1);
+}
+
+// Recorders write descriptions of data that lack even the common fields.
+TEST(Track, OfAnotherKindMayHaveADescriptionOfText) {
+    Movie movie = PlainMovie();
+    movie.tracks.push_back(movies::OtherTrack("meta", 1, 600, 600));
+    movie.tracks[1].descriptions = {Box("mett").Text("application/octet-stream")};
+    EXPECT_EQ(ParsedMovie(movie).Result(), NCF_OK);
+}
+
+TEST(Track, AnswersToItsOwnInterfacesOnly) {
+    Movie movie = PlainMovie();
+    movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 4800));
+    const ParsedMovie parsed(movie);
+    const auto video = parsed.Video();
+    host::Ref<ITrackInfo> track;
+    host::Ref<IVideoTrackInfo> again;
+    host::Ref<IAudioTrackInfo> sound;
+    host::Ref<INCFUnknown> root;
+    EXPECT_EQ(host::Query(video.get(), track), NCF_OK);
+    EXPECT_EQ(host::Query(track.get(), again), NCF_OK);
+    EXPECT_EQ(again.get(), video.get());
+    EXPECT_EQ(host::Query(track.get(), sound), NCF_E_NOINTERFACE);
+    EXPECT_EQ(host::Query(track.get(), root), NCF_OK);
+    const auto other = parsed.Sound();
+    EXPECT_EQ(host::Query(other.get(), sound), NCF_OK);
+    EXPECT_EQ(host::Query(other.get(), again), NCF_E_NOINTERFACE);
+}
+
+TEST(Track, OutlivesItsParser) {
+    host::Ref<IQTSampleTable> table;
+    host::Ref<IVideoSampleDescription> description;
+    {
+        const ParsedMovie parsed(PlainMovie());
+        table = parsed.Samples();
+        description = parsed.VideoDescription();
+    }
+    EXPECT_EQ(AskSample(table, &IQTSampleTable::GetDataSizePerSample, 30), 100u);
+    EXPECT_EQ(Ask(description, &IVideoSampleDescription::GetDataFormat), movies::Code("avc1"));
+}
+
+}  // namespace
