@@ -1,0 +1,199 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// What is common to both kinds of clip, seen through the one that exists:
+// services made on first use, sound beside picture, names.
+
+#include "tests/unit/clips/ClipFixture.h"
+#include "tests/unit/clips/FakeWrapper.h"
+
+namespace {
+
+class BaseClipServices : public ClipTest {
+protected:
+    BaseClipServices() {
+        wrapper = new FakeWrapper(&journal);
+        host->maker(QTWrapper::CompID_QuickTimeWrapper, [this](const GUID& iid, void** out) {
+            return wrapper->QueryInterface(iid, out);
+        });
+        LoadVideo();
+        journal.clear();
+    }
+    ~BaseClipServices() override { wrapper->Release(); }
+
+    FakeWrapper* wrapper;
+};
+
+// A picture of 10 seconds at 25 frames a second beside sound of 48 kHz.
+class BaseClipSound : public ClipTest {
+protected:
+    BaseClipSound() {
+        parser->AddVideoTrack(1);
+        parser->AddAudioTrack(2);
+        Video().table->numSamples = 250;
+        Video().mediaTimescale = 25;
+        Video().mediaDuration = 250;
+        Video().trackTimescale = 1000;
+        Video().trackDuration = 10000;
+        Load();
+        clip->SetEditRate(EditorSettings());
+        clip->SetMovieLength(EditorSettings());
+    }
+    FakeAudioTrack& Sound() { return *parser->audioTracks[0]; }
+};
+
+}  // namespace
+
+// --- services ---------------------------------------------------------------------------
+
+TEST_F(BaseClipServices, OpensTheWrapperOnFirstUse) {
+    EXPECT_EQ(host->creations(QTWrapper::CompID_QuickTimeWrapper), 0);
+    NCFSmartPtr<QTWrapper::IQuickTimeWrapper> first;
+    NCFSmartPtr<QTWrapper::IQuickTimeWrapper> second;
+    EXPECT_EQ(clip->GetQuickTimeInterface(first), NCF_OK);
+    EXPECT_EQ(clip->GetQuickTimeInterface(second), NCF_OK);
+    EXPECT_EQ(first, second);
+    EXPECT_EQ(wrapper->openedPath, file.path());
+    EXPECT_EQ(journal.lines(),
+              (std::vector<std::string>{"create wrapper", "wrapper.NewMovieFromFilePath"}));
+}
+
+TEST_F(BaseClipServices, KeepsAWrapperWhoseMovieFailedToOpen) {
+    wrapper->results["NewMovieFromFilePath"] = NCF_E_FAIL;
+    NCFSmartPtr<QTWrapper::IQuickTimeWrapper> out;
+    EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_E_FAIL);
+    EXPECT_TRUE(out.isNull());
+    EXPECT_EQ(log->count(ReturnRecord("80000008", "qtWrapper_->NewMovieFromFilePath(fileName_)",
+                                      "BaseClip::GetQuickTimeInterface")),
+              1);
+    EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_OK);
+    EXPECT_FALSE(out.isNull());
+    EXPECT_EQ(journal.count("wrapper.NewMovieFromFilePath"), 1);
+}
+
+TEST_F(BaseClipServices, HandsARefusedWrapperOn) {
+    host->refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_OUTOFMEMORY, 1);
+    NCFSmartPtr<QTWrapper::IQuickTimeWrapper> out;
+    EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(log->count(ReturnRecord("80000002",
+                                      "componentFactory_->CreateComponent("
+                                      "QTWrapper::CompID_QuickTimeWrapper, NULL, "
+                                      "QTWrapper::IID_IQuickTimeWrapper, (void **)&qtWrapper_)",
+                                      "BaseClip::GetQuickTimeInterface")),
+              1);
+    EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_OK) << "asked again";
+}
+
+TEST_F(BaseClipServices, MakesEachReaderOnce) {
+    NCFSmartPtr<QTWrapper::IQTVideoReader> video;
+    NCFSmartPtr<QTWrapper::IQTVideoReader> sameVideo;
+    NCFSmartPtr<QTWrapper::IQTAudioReader> audio;
+    NCFSmartPtr<QTWrapper::IQTAudioReader> sameAudio;
+    EXPECT_EQ(clip->GetQuickTimeVideoReader(video), NCF_OK);
+    EXPECT_EQ(clip->GetQuickTimeVideoReader(sameVideo), NCF_OK);
+    EXPECT_EQ(clip->GetQuickTimeAudioReader(audio), NCF_OK);
+    EXPECT_EQ(clip->GetQuickTimeAudioReader(sameAudio), NCF_OK);
+    EXPECT_EQ(video, sameVideo);
+    EXPECT_EQ(audio, sameAudio);
+    EXPECT_EQ(journal.lines(),
+              (std::vector<std::string>{"create wrapper", "wrapper.NewMovieFromFilePath",
+                                        "wrapper.GetQTVideoReader", "wrapper.GetQTAudioReader"}));
+}
+
+TEST_F(BaseClipServices, HandsRefusedReadersOn) {
+    wrapper->results["GetQTVideoReader"] = NCF_E_ABORT;
+    wrapper->results["GetQTAudioReader"] = NCF_E_FAIL;
+    NCFSmartPtr<QTWrapper::IQTVideoReader> video;
+    NCFSmartPtr<QTWrapper::IQTAudioReader> audio;
+    EXPECT_EQ(clip->GetQuickTimeVideoReader(video), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetQuickTimeAudioReader(audio), NCF_E_FAIL);
+    EXPECT_EQ(log->count(ReturnRecord("80000007", "qtWrapper->GetQTVideoReader(qtAPIVideoReader_)",
+                                      "BaseClip::GetQuickTimeVideoReader")),
+              1);
+    EXPECT_EQ(log->count(ReturnRecord("80000008", "qtWrapper->GetQTAudioReader(qtAPIAudioReader_)",
+                                      "BaseClip::GetQuickTimeAudioReader")),
+              1);
+    host->refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_OUTOFMEMORY);
+    NCFSmartPtr<QTWrapper::IQuickTimeWrapper> out;
+    EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_OK) << "made already";
+}
+
+TEST_F(BaseClipServices, HandsOutItsPath) {
+    EXPECT_EQ(TextOf(clip->GetFileName().inArg()), file.path());
+}
+
+TEST(BaseClip, KnowsTwoRawCodecsByTheirExactCode) {
+    EXPECT_TRUE(BaseClip::IsNativeQuickTimeCodec(0x57524157));   // 'WRAW'
+    EXPECT_TRUE(BaseClip::IsNativeQuickTimeCodec(0x72617720));   // 'raw '
+    EXPECT_FALSE(BaseClip::IsNativeQuickTimeCodec(0x52415720));  // 'RAW '
+    EXPECT_FALSE(BaseClip::IsNativeQuickTimeCodec(0));
+}
+
+TEST(BaseClip, NamesOtherCodecsUnknown) {
+    NCFSmartPtr<INCFString> name = HostText("");
+    EXPECT_EQ(BaseClip::GetNativeQuickTimeCodecName(0x61766331, name), NCF_OK);
+    EXPECT_EQ(TextOf(name.inArg()), "Unknown Codec");
+}
+
+// --- sound beside the picture ----------------------------------------------------------------
+
+TEST_F(BaseClipSound, GivesThePicturesFigureWhenBothAreEquallyLong) {
+    ncfUInt64 samples = 0;
+    bool enough = false;
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
+    EXPECT_EQ(samples, 480000u);
+    EXPECT_TRUE(enough);
+    EXPECT_EQ(log->count("BaseClip::ObtainAudioTrackLengthaudioSamplesInVideoTS: 480000; "
+                         "audioSamplesInAudioTrackTS: 480000"),
+              1);
+}
+
+TEST_F(BaseClipSound, CutsSoundToThePicture) {
+    Sound().trackDuration = 10500;
+    ncfUInt64 samples = 0;
+    bool enough = false;
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
+    EXPECT_EQ(samples, 480000u);
+    EXPECT_TRUE(enough);
+}
+
+TEST_F(BaseClipSound, KeepsShortSoundAsItIs) {
+    Sound().trackDuration = 9000;
+    ncfUInt64 samples = 0;
+    bool enough = true;
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
+    EXPECT_EQ(samples, 432000u);
+    EXPECT_FALSE(enough);
+    EXPECT_EQ(log->count("BaseClip::ObtainAudioTrackLengthNot enough audio, "
+                         "audioSamplesInVideoTS(480000) > audioSamplesInAudioTrackTS(432000)"),
+              1);
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_OK) << "without the flag";
+}
+
+TEST_F(BaseClipSound, HandsItsFailuresOn) {
+    ncfUInt64 samples = 5;
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, nullptr), NCF_E_INVALIDARG);
+    EXPECT_EQ(clip->ObtainAudioTrackLength(9, &samples), NCF_E_NOTFOUND);
+    EXPECT_EQ(samples, 0u);
+    EXPECT_EQ(log->count(ReturnRecord("8000000c", "GetAudioTrackMetadata(qtTrack, &audioInfo)",
+                                      "BaseClip::ObtainAudioTrackLength")),
+              1);
+    Sound().results["GetTrackDuration"] = NCF_E_ABORT;
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_E_ABORT);
+    EXPECT_EQ(log->count(ReturnRecord("80000007",
+                                      "CalculateAudioTrackLengthInSamples(qtTrack, "
+                                      "&audioSamplesInAudioTrackTS)",
+                                      "BaseClip::ObtainAudioTrackLength")),
+              1);
+    Sound().results.clear();
+    Load();  // a clip that was not asked for rate and length
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(log->count(ReturnRecord("a0000068", "GetEditRate(&avgMovieEditRate)",
+                                      "BaseClip::ObtainAudioTrackLength")),
+              1);
+    clip->SetEditRate(EditorSettings());
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(log->count(ReturnRecord("a0000068", "GetMovieLength(&numVideoSamples)",
+                                      "BaseClip::ObtainAudioTrackLength")),
+              1);
+}

@@ -1,0 +1,171 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "source/clips/LoadMedia.h"
+
+#include "tests/unit/clips/ClipFixture.h"
+
+namespace {
+
+class LoadMediaTest : public ClipTest {
+protected:
+    NCFRESULT Ask(const std::string& path) {
+        return LoadMedia(HostText(path), NCFSmartPtr<INCFConsole>(&host->console()),
+                         NCFSmartPtr<INCFComponentFactory>(host->factory()), media);
+    }
+    NCFRESULT IsContainer(const std::string& path) {
+        return IsQuickTimeContainer(HostText(path), NCFSmartPtr<INCFConsole>(&host->console()),
+                                    &flag);
+    }
+    NCFRESULT IsContainer(const std::vector<ncfUInt8>& bytes) {
+        const TempFile small(bytes, "small.mov");
+        return IsContainer(small.path());
+    }
+    static std::vector<ncfUInt8> Bytes(const std::string& text) {
+        return std::vector<ncfUInt8>(text.begin(), text.end());
+    }
+    ~LoadMediaTest() override { media.reset(); }
+
+    std::tr1::shared_ptr<BaseClip> media;
+    ncfBool flag = 7;
+};
+
+}  // namespace
+
+// --- LoadMedia ---------------------------------------------------------------------------
+
+TEST_F(LoadMediaTest, GivesALoadedClip) {
+    parser->AddVideoTrack(1);
+    EXPECT_EQ(Ask(file.path()), NCF_OK);
+    ASSERT_TRUE(media);
+    EXPECT_TRUE(media->IsLoaded());
+    EXPECT_EQ(log->records().front().text, "LoadMediatry QT Container... ");
+    EXPECT_EQ(log->records().back().text, "LoadMediasucceeded!");
+}
+
+TEST_F(LoadMediaTest, RefusesANullPathAndLeavesTheClip) {
+    parser->AddVideoTrack(1);
+    ASSERT_EQ(Ask(file.path()), NCF_OK);
+    const BaseClip* const former = media.get();
+    EXPECT_EQ(LoadMedia(nullptr, NCFSmartPtr<INCFConsole>(&host->console()),
+                        NCFSmartPtr<INCFComponentFactory>(host->factory()), media),
+              NCF_E_INVALIDARG);
+    EXPECT_EQ(media.get(), former);
+    EXPECT_EQ(log->count("CHK_INARG(filePath.inArg())LoadMedia"), 1);
+}
+
+TEST_F(LoadMediaTest, KeepsTheClipThatFailed) {
+    parser->script = {{NCF_E_FAIL, 0, 0}};
+    EXPECT_EQ(Ask(file.path()), NMA_E_NOTINITIALIZED);
+    ASSERT_TRUE(media);
+    EXPECT_FALSE(media->IsLoaded());
+}
+
+TEST_F(LoadMediaTest, HidesThePreciseFailureOfTheFirstRoute) {
+    parser->AddTimecodeTrack(1);
+    EXPECT_EQ(Ask(file.path()), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(Console(1, "Movie doesn't contain any video/audio tracks!\n"), 1);
+}
+
+TEST_F(LoadMediaTest, LetsAFileThatCannotBeOpenedThrow) {
+    RecordingNMALog lines(1);
+    try {
+        Ask(testing::TempDir() + "no_such_movie.mov");
+        FAIL() << "nothing was thrown";
+    } catch (NCFRESULT result) {
+        EXPECT_EQ(result, NCF_E_HANDLE);
+    }
+    EXPECT_TRUE(
+        lines.contains("SimpleFileIO error. CreateFileW failed. HRESULT = 0x2, "
+                       "public_include/SimpleFileIO("));
+}
+
+// --- IsQuickTimeContainer -----------------------------------------------------------------
+
+TEST_F(LoadMediaTest, RecognisesAFileTypeAtom) {
+    EXPECT_EQ(IsContainer(Bytes(std::string("\0\0\0\x14", 4) + "ftypqt  no movie at all")), NCF_OK);
+    EXPECT_EQ(flag, 1);
+}
+
+TEST_F(LoadMediaTest, DoesNotRecogniseClassicMovies) {
+    for (const char* type : {"moov", "mdat", "wide", "free", "pytf", "Ftyp"}) {
+        EXPECT_EQ(IsContainer(Bytes(std::string("\0\0\0\x14", 4) + type + " and more")), NCF_OK);
+        EXPECT_EQ(flag, 0) << type;
+    }
+}
+
+TEST_F(LoadMediaTest, TakesAShortFileForNoMovie) {
+    EXPECT_EQ(IsContainer(Bytes("1234fty")), NCF_OK);
+    EXPECT_EQ(flag, 0);
+    EXPECT_EQ(IsContainer(Bytes("1234ftyp")), NCF_OK);
+    EXPECT_EQ(flag, 1);
+}
+
+TEST_F(LoadMediaTest, FailsOnAnEmptyFile) {
+    RecordingNMALog lines(1);
+    EXPECT_EQ(IsContainer(std::vector<ncfUInt8>()), NCF_E_FAIL);
+    EXPECT_EQ(flag, 0);
+    EXPECT_TRUE(host->console().lines().empty());
+}
+
+TEST_F(LoadMediaTest, RefusesAnEmptyPath) {
+    EXPECT_EQ(IsContainer(""), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(flag, 0);
+    EXPECT_EQ(log->count("IsQuickTimeContainerfilePath->IsEmpty() !"), 1);
+    EXPECT_EQ(log->records().back().kind, slog::kError);
+}
+
+TEST_F(LoadMediaTest, TellsTheConsoleOfAFileThatCannotBeOpened) {
+    RecordingNMALog lines(1);
+    EXPECT_EQ(IsContainer(testing::TempDir() + "no_such_movie.mov"), NCF_E_HANDLE);
+    EXPECT_EQ(flag, 0);
+    EXPECT_EQ(Console(1, "Throw caught in QuickTimeContainer::IsContainerSupported: 80000006\n"),
+              1);
+    EXPECT_EQ(IsContainer(testing::TempDir()), NCF_E_HANDLE) << "a folder is no file";
+}
+
+TEST_F(LoadMediaTest, ChecksTheArgumentsOfTheTestInOrder) {
+    NCFSmartPtr<INCFConsole> console(&host->console());
+    EXPECT_EQ(IsQuickTimeContainer(nullptr, nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(log->records().back().text, "CHK_PTR(console_.inArg())IsQuickTimeContainer");
+    EXPECT_EQ(IsQuickTimeContainer(nullptr, console, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(log->records().back().text, "CHK_PTR(filePath.inArg())IsQuickTimeContainer");
+    EXPECT_EQ(IsQuickTimeContainer(HostText("x"), console, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(log->records().back().text, "CHK_PTR(isQTContainer)IsQuickTimeContainer");
+}
+
+// --- ConvertSlashesInPlace -------------------------------------------------------------------
+
+TEST(ConvertSlashesInPlace, TurnsEveryForwardSlash) {
+    NCFSmartPtr<INCFString> path = HostText("C:/a\\b/c.mov");
+    EXPECT_EQ(ConvertSlashesInPlace(path), NCF_OK);
+    EXPECT_EQ(TextOf(path.inArg()), "C:\\a\\b\\c.mov");
+    path = HostText("//server//share/");
+    EXPECT_EQ(ConvertSlashesInPlace(path), NCF_OK);
+    EXPECT_EQ(TextOf(path.inArg()), "\\\\server\\\\share\\");
+}
+
+TEST(ConvertSlashesInPlace, KeepsTheEncoding) {
+    for (const ncfUInt32 encoding : {kNCFASCII, kNCFUTF8, kNCFUTF16, kNCFUTF32, kNCFWCHAR}) {
+        NCFSmartPtr<INCFString> path = HostText("/a/b.mov");
+        ASSERT_EQ(path->ConvertTo(encoding), NCF_OK);
+        EXPECT_EQ(ConvertSlashesInPlace(path), NCF_OK);
+        EXPECT_EQ(path->GetEncoding(), encoding);
+        EXPECT_EQ(TextOf(path.inArg()), "\\a\\b.mov");
+    }
+}
+
+TEST(ConvertSlashesInPlace, CountsCharactersBeyondSixteenBitsAsOne) {
+    NCFSmartPtr<INCFString> path = HostText("/\xF0\x9F\x8E\xAC/\xF0\x9F\x8E\xAC\xC3\xA9/c.mov");
+    ASSERT_EQ(path->ConvertTo(kNCFUTF16), NCF_OK);
+    EXPECT_EQ(ConvertSlashesInPlace(path), NCF_OK);
+    EXPECT_EQ(TextOf(path.inArg()), "\\\xF0\x9F\x8E\xAC\\\xF0\x9F\x8E\xAC\xC3\xA9\\c.mov");
+}
+
+TEST(ConvertSlashesInPlace, LeavesAPathWithoutSlashes) {
+    for (const char* text : {"", "clip.mov", "C:\\clip.mov"}) {
+        NCFSmartPtr<INCFString> path = HostText(text);
+        EXPECT_EQ(ConvertSlashesInPlace(path), NCF_OK);
+        EXPECT_EQ(TextOf(path.inArg()), text);
+    }
+}
