@@ -46,7 +46,8 @@ FolderFacts Scan(Session& session, const std::filesystem::path& folder) {
         facts.name = host::text::ReadUtf8(name.get());
     }
     info->GetModificationDate(&facts.newest);
-    for (const FolderClip& clip : FolderClips(session, path.get()).clips()) {
+    const FolderClips clips(session, path.get());
+    for (const FolderClip& clip : clips.clips()) {
         facts.movies.push_back(host::DisplayPath(clip.path));
     }
     return facts;

@@ -69,7 +69,7 @@ Session::Session(const SessionOptions& options) {
         }
     });
     host::RegisterXmlComponents(*host_);
-    host_->RegisterComponent(NCFCompID_QTParser, host::QTParserMaker());
+    host_->RegisterComponent(NCFCompID_QTParser, header_parser::QTParserMaker());
     host::RegisterQuickTimeComponents(*host_);
 
     host::LoadFailure failure;

@@ -82,7 +82,7 @@ NCFRESULT QuickTimeContainer::GetAAFMasterClips(IAAFClips** ppClips) {
         }
         IAAFSmartPointer<IAAFFile> described;
         NCF_RETURN_TEXT("NewAAFFromMovie(media_, console_, &aafFile_, componentFactory_)",
-                        NewAAFFromMovie(media_, console_, &described, componentFactory_));
+                        NewAAFFromMovie(media_, console_, &described, componentFactory_.inArg()));
         aafFile_ = described;
         slog::Progress(ncfFunction) << "NewAAFFromMovie completed successfully!";
         if (!ppClips) {
@@ -173,10 +173,10 @@ NCFRESULT QuickTimeContainer::GetMetadata(ncfSInt32 index, IAAFFile** ppData) {
             return NCF_OK;
         }
         *ppData = nullptr;
-        if (aafFile_.IsNull()) {
+        if (!aafFile_) {
             return NMA_E_NOTINITIALIZED;
         }
-        *ppData = aafFile_.Get();
+        *ppData = aafFile_;
         (*ppData)->AddRef();
         return NCF_OK;
     });

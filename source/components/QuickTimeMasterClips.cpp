@@ -69,7 +69,8 @@ NCFRESULT QuickTimeMasterClips::GetMetadata(ncfSInt32 index, IAAFFile** ppData) 
         // clang-format off
         NCF_RETURN(LoadMedia(_MCList[index].InArg(), _pConsole, _pComponentFactory, media));
         *ppData = nullptr;
-        NCF_RETURN(NewAAFFromMovie(media, _pConsole, ppData, _pComponentFactory));
+        NCF_RETURN_TEXT("NewAAFFromMovie(media, _pConsole, ppData, _pComponentFactory)",
+                        NewAAFFromMovie(media, _pConsole, ppData, _pComponentFactory.inArg()));
         // clang-format on
         return NCF_OK;
     });
