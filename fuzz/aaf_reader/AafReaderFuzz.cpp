@@ -1,24 +1,44 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "reference_host/aaf/model/ClassRegistry.h"
+#include "reference_host/aaf/model/Model.h"
+#include "reference_host/aaf/stored/ModelReader.h"
+#include "reference_host/aaf/stored/ModelWriter.h"
 #include "reference_host/aaf/stored/StoredError.h"
 #include "reference_host/aaf/stored/TreeReader.h"
 #include "reference_host/aaf/stored/TreeWriter.h"
 
 #include <cstdlib>
 
+using namespace aaf::stored;
+
+namespace {
+
 // Whatever can be read must come out the same when it is written and read again.
-extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    using namespace aaf::stored;
-    StoredObject tree;
+void checkTree(const StoredObject& tree) {
     Bytes written;
     try {
-        tree = readTree(Bytes(data, data + size));
         written = writeTree(tree, SectorSize::Bytes512);
     } catch (const StoredError&) {
-        return 0;
+        return;
     }
     if (writeTree(readTree(written), SectorSize::Bytes512) != written) {
         std::abort();
+    }
+}
+
+}  // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    static const aaf::ClassRegistry classes;
+    try {
+        const StoredObject tree = readTree(Bytes(data, data + size));
+        checkTree(tree);
+        const aaf::RefPtr<aaf::Model> model = aaf::Model::Create(classes);
+        const aaf::RefPtr<aaf::Object> header = readModel(tree, *model);
+        treeOfModel(*model, *header);
+    } catch (const StoredError&) {
+        // Refused, as most of what a fuzzer makes should be.
     }
     return 0;
 }

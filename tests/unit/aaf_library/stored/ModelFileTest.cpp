@@ -165,6 +165,45 @@ TEST(ModelFile, LocalNumbersOfAnotherWriterAreTranslated) {
     EXPECT_EQ(treeOfModel(*read.model, *read.header), original);
 }
 
+// Some built-in properties have local numbers too.
+TEST(ModelFile, BuiltInPropertiesWithLocalNumbersAreTranslated) {
+    const sample::SampleModel sample = sample::wholeModel();
+    Object* descriptor =
+        sample::mob(*sample.header, 0).ObjectAt(prop::SourceMob_EssenceDescription);
+    const RefPtr<Object> mpeg =
+        sample.model->CreateObject(*sample.model->FindClass(AUID_AAFMPEGVideoDescriptor));
+    ASSERT_GE(mpeg->PutInteger(prop::MPEGVideoDescriptor_BitRate, 50000000), 0);
+    ASSERT_GE(descriptor->AppendObject(prop::MultipleDescriptor_FileDescriptors, mpeg->Identity()),
+              0);
+    const Bytes file = bytesOf(sample);
+    const sample::SampleModel read = reread(file);
+    descriptor = sample::mob(*read.header, 0).ObjectAt(prop::SourceMob_EssenceDescription);
+    const Object* again = descriptor->ObjectAt(prop::MultipleDescriptor_FileDescriptors, 1);
+    ASSERT_NE(again, nullptr);
+    EXPECT_EQ(again->IntegerOr(prop::MPEGVideoDescriptor_BitRate, 0), 50000000);
+    // The numbers did differ, or nothing was tried.
+    EXPECT_NE(read.model->FindProperty(prop::MPEGVideoDescriptor_BitRate.id)->pid(),
+              sample.model->FindProperty(prop::MPEGVideoDescriptor_BitRate.id)->pid());
+    EXPECT_NE(read.model->FindProperty(sample::quadPropertyId), nullptr);
+}
+
+TEST(ModelFile, EssenceIsKeptAsAStream) {
+    const sample::SampleModel sample = sample::wholeModel();
+    const RefPtr<Object> essence =
+        sample.model->CreateObject(*sample.model->FindClass(AUID_AAFEssenceData));
+    ASSERT_GE(essence->PutStruct(prop::EssenceData_MobID, sample::mobId(5)), 0);
+    essence->RequireValue(prop::EssenceData_Data)->bytes() = Bytes(700000, 0x2E);
+    Object* content = sample.header->ObjectAt(prop::Header_Content);
+    ASSERT_GE(content->AddToSet(prop::ContentStorage_EssenceData, essence->Identity()), 0);
+    for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
+        const sample::SampleModel read = reread(bytesOf(sample, size));
+        const Object* again = read.header->ObjectAt(prop::Header_Content)
+                                  ->ObjectAt(prop::ContentStorage_EssenceData, 0);
+        ASSERT_NE(again, nullptr);
+        EXPECT_EQ(again->FindValue(prop::EssenceData_Data)->bytes(), Bytes(700000, 0x2E));
+    }
+}
+
 TEST(ModelFile, OnlyDefinitionsThatAreReferredToOrOwnAreStored) {
     const sample::SampleModel sample = sample::wholeModel();
     const StoredObject tree = treeOfModel(*sample.model, *sample.header);

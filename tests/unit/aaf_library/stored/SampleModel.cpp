@@ -121,13 +121,13 @@ private:
         must(component.PutWeak(prop::Component_DataDefinition, definition->Identity()));
     }
 
-    RefPtr<Object> sourceClip(const GUID& kind, const aafMobID_t& source) {
+    RefPtr<Object> sourceClip(const GUID& kind, const aafMobID_t& source, int slot) {
         RefPtr<Object> object = make(AUID_AAFSourceClip);
         setKind(*object, kind);
         must(object->PutInteger(prop::Component_Length, 100));
         must(object->PutStruct(prop::SourceReference_SourceID, source));
-        must(object->PutInteger(prop::SourceReference_SourceMobSlotID, 1));
-        must(object->PutInteger(prop::SourceClip_StartTime, 7));
+        must(object->PutInteger(prop::SourceReference_SourceMobSlotID, slot));
+        must(object->PutInteger(prop::SourceClip_StartTime, slot == 0 ? 0 : 7));
         return object;
     }
 
@@ -148,13 +148,13 @@ private:
 
     RefPtr<Object> masterMob() {
         RefPtr<Object> object = mob(AUID_AAFMasterMob, 9, L"clip \xE4 \x4E2D");
-        must(object->AppendObject(prop::Mob_Slots,
-                                  id(slot(1, L"V1", sourceClip(kAAFDataDef_Picture, mobId(5))))));
+        must(object->AppendObject(
+            prop::Mob_Slots, id(slot(1, L"V1", sourceClip(kAAFDataDef_Picture, mobId(5), 1)))));
         RefPtr<Object> sequence = make(AUID_AAFSequence);
         setKind(*sequence, kAAFDataDef_Sound);
         must(sequence->PutInteger(prop::Component_Length, 100));
         must(sequence->AppendObject(prop::Sequence_Components,
-                                    id(sourceClip(kAAFDataDef_Sound, mobId(5)))));
+                                    id(sourceClip(kAAFDataDef_Sound, mobId(5), 2))));
         must(object->AppendObject(prop::Mob_Slots, id(slot(2, L"", sequence))));
         must(object->AppendObject(prop::Mob_UserComments, id(comment(L"Scene", L""))));
         must(object->AppendObject(prop::Mob_UserComments, id(comment(L"", L"two \U0001F3AC"))));
@@ -199,8 +199,10 @@ private:
         own->RequireValue(model_->FindProperty(ownPropertyId)->key())->bytes() = Bytes(24, 3);
         must(descriptor->AppendObject(prop::EssenceDescriptor_Locator, id(own)));
         must(object->PutObject(prop::SourceMob_EssenceDescription, id(descriptor)));
-        must(object->AppendObject(prop::Mob_Slots,
-                                  id(slot(1, L"V1", sourceClip(kAAFDataDef_Picture, mobId(7))))));
+        must(object->AppendObject(
+            prop::Mob_Slots, id(slot(1, L"V1", sourceClip(kAAFDataDef_Picture, aafMobID_t{}, 0)))));
+        must(object->AppendObject(
+            prop::Mob_Slots, id(slot(2, L"A1", sourceClip(kAAFDataDef_Sound, aafMobID_t{}, 0)))));
         return object;
     }
 
