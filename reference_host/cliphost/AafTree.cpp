@@ -4,6 +4,7 @@
 #include "reference_host/cliphost/AafTree.h"
 
 #include <algorithm>
+#include <map>
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
@@ -160,6 +161,46 @@ TreeNode ReadTree(IAAFFile* file) {
     }
     root.branches.push_back(std::move(branch));
     return root;
+}
+
+namespace {
+
+void ReplaceIds(TreeNode& node, const std::map<std::string, std::string>& numbers) {
+    for (TreeNode::Fact& fact : node.facts) {
+        const auto found = fact.name == "SourceID" ? numbers.find(fact.value) : numbers.end();
+        if (found != numbers.end()) {
+            fact.value = found->second;
+        }
+    }
+    for (TreeNode::Branch& branch : node.branches) {
+        for (TreeNode& child : branch.nodes) {
+            ReplaceIds(child, numbers);
+        }
+    }
+}
+
+}  // namespace
+
+std::string ToReadableText(const TreeNode& tree, int indent) {
+    std::map<std::string, std::string> numbers = {{ToText(aafMobID_t{}), "nil"}};
+    TreeNode copy = tree;
+    std::string text;
+    for (TreeNode::Branch& branch : copy.branches) {
+        for (std::size_t i = 0; i < branch.nodes.size(); ++i) {
+            const std::string number = "mob " + std::to_string(i + 1);
+            for (const TreeNode::Fact& fact : branch.nodes[i].facts) {
+                if (fact.name == "MobID") {
+                    numbers[fact.value] = number;
+                }
+            }
+            branch.nodes[i].title = number + ": " + branch.nodes[i].title;
+        }
+        for (TreeNode& mob : branch.nodes) {
+            ReplaceIds(mob, numbers);
+            text += ToText(mob, indent);
+        }
+    }
+    return text;
 }
 
 }  // namespace cliphost

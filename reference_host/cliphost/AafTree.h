@@ -13,4 +13,8 @@ namespace cliphost {
 // extension properties. Mobs come master, file, source.
 TreeNode ReadTree(IAAFFile* file);
 
+// The same for people: mobs get numbers, which stand for their ids where other
+// mobs refer to them.
+std::string ToReadableText(const TreeNode& tree, int indent = 0);
+
 }  // namespace cliphost

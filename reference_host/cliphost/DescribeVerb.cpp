@@ -117,11 +117,7 @@ void DescribeRun::Take(const Description& description) {
     fmt::print("{}{}\n", DisplayPath(description.movie),
                saved.empty() ? "" : " -> " + DisplayPath(saved));
     if (!options_.quiet) {
-        for (const TreeNode::Branch& branch : tree.branches) {
-            for (const TreeNode& mob : branch.nodes) {
-                fmt::print("{}", ToText(mob, 1));
-            }
-        }
+        fmt::print("{}", ToReadableText(tree, 1));
     }
 }
 

@@ -26,20 +26,42 @@ nlohmann::ordered_json JsonOf(const TreeNode& node) {
     return json;
 }
 
-void Write(const TreeNode& node, int indent, std::string& out) {
-    const std::string margin(static_cast<std::size_t>(indent) * 2, ' ');
-    out += margin + node.title + "\n";
-    std::size_t widest = 0;
-    for (const TreeNode::Fact& fact : node.facts) {
-        widest = std::max(widest, fact.name.size());
+constexpr std::size_t kLineWidth = 120;
+
+std::string OneLine(const std::vector<TreeNode::Fact>& facts) {
+    std::string line;
+    for (const TreeNode::Fact& fact : facts) {
+        line += fmt::format("{}{} {}", line.empty() ? "  " : ", ", fact.name, fact.value);
     }
-    for (const TreeNode::Fact& fact : node.facts) {
-        out += fmt::format("{}  {:<{}}  {}\n", margin, fact.name, widest, fact.value);
+    return line;
+}
+
+// A node's facts stand behind its title where a line holds them, else below it.
+// A part that is alone stands behind the name of its property.
+void Write(const TreeNode& node, int indent, const std::string& property, std::string& out) {
+    const std::string margin(static_cast<std::size_t>(indent) * 2, ' ');
+    const std::string head = margin + property + node.title;
+    const std::string facts = OneLine(node.facts);
+    if (head.size() + facts.size() <= kLineWidth) {
+        out += head + facts + "\n";
+    } else {
+        out += head + "\n";
+        std::size_t widest = 0;
+        for (const TreeNode::Fact& fact : node.facts) {
+            widest = std::max(widest, fact.name.size());
+        }
+        for (const TreeNode::Fact& fact : node.facts) {
+            out += fmt::format("{}    {:<{}}  {}\n", margin, fact.name, widest, fact.value);
+        }
     }
     for (const TreeNode::Branch& branch : node.branches) {
+        if (branch.nodes.size() == 1) {
+            Write(branch.nodes[0], indent + 1, branch.name + ": ", out);
+            continue;
+        }
         out += fmt::format("{}  {}:\n", margin, branch.name);
         for (const TreeNode& child : branch.nodes) {
-            Write(child, indent + 2, out);
+            Write(child, indent + 2, "", out);
         }
     }
 }
@@ -48,7 +70,7 @@ void Write(const TreeNode& node, int indent, std::string& out) {
 
 std::string ToText(const TreeNode& node, int indent) {
     std::string out;
-    Write(node, indent, out);
+    Write(node, indent, "", out);
     return out;
 }
 

@@ -1,0 +1,63 @@
+#!/usr/bin/env bash
+# The main job on real movies: demo.sh BUILD [PATH ...]
+# Without a path a folder of sample movies is made first.
+set -euo pipefail
+build=$1
+shift
+cliphost=$build/cliphost
+out=demo-output
+mkdir -p "$out"
+
+make_movies() { # make_movies FOLDER
+  local folder=$1
+  mkdir -p "$folder"
+  make() { # make NAME FFMPEG-ARGUMENTS...
+    local name=$1
+    shift
+    [ -s "$folder/$name" ] || ffmpeg -nostdin -y -loglevel error "$@" -metadata creation_time=2026-01-31T12:00:00Z "$folder/$name"
+  }
+  local hd='testsrc2=size=1920x1080:rate=25:duration=2'
+  local ntsc='testsrc2=size=720x486:rate=30000/1001:duration=2'
+  local tone='sine=frequency=440:sample_rate=48000:duration=2'
+  make prores_hq_1080p25.mov -f lavfi -i "$hd" -f lavfi -i "$tone" -c:v prores_ks -profile:v hq \
+    -vendor apl0 -c:a pcm_s24le -ac 2 -timecode 10:00:00:00
+  make prores_422_486i_bottom_first.mov -f lavfi -i "$ntsc" -vf setfield=bff -flags +ildct \
+    -c:v prores_ks -profile:v standard -timecode '01:00:00;00'
+  make prores_4444_alpha.mov -f lavfi -i "$hd" -vf 'format=yuva444p10le,geq=lum=p(X\,Y):cb=p(X\,Y):cr=p(X\,Y):a=X/2' \
+    -t 0.2 -c:v prores_ks -profile:v 4444
+  make h264_aac_bframes.mov -f lavfi -i "$hd" -f lavfi -i "$tone" -c:v libx264 -bf 2 -c:a aac -movflags +faststart
+  make dv_pal.mov -f lavfi -i 'testsrc2=size=720x576:rate=25:duration=1' -c:v dvvideo -pix_fmt yuv420p -top 0
+  make mjpeg_three_sounds.mov -f lavfi -i 'testsrc2=size=640x480:rate=24:duration=2' -f lavfi -i "$tone" \
+    -map 0 -map 1 -map 1 -map 1 -c:v mjpeg -c:a pcm_s16le -ac:a:0 1 -ac:a:1 2 -ac:a:2 6
+  make v210_10bit.mov -f lavfi -i "$hd" -t 0.2 -c:v v210
+  make mpeg2_1080.mov -f lavfi -i "$hd" -c:v mpeg2video -b:v 25M
+  make sound_only.mov -f lavfi -i "$tone" -c:a pcm_s24be -ac 2
+  make one_picture.mov -f lavfi -i 'testsrc2=size=400x300:rate=25:duration=1' -frames:v 1 -c:v png
+}
+
+if [ $# -eq 0 ]; then
+  echo "making sample movies in $out/movies ..."
+  make_movies "$out/movies"
+  set -- "$out/movies"
+fi
+
+echo
+echo '== the module'
+"$cliphost" plugin
+
+status=0
+for path in "$@"; do
+  if [ -d "$path" ]; then
+    echo
+    echo "== scan $path"
+    "$cliphost" scan "$path" || status=$?
+  fi
+done
+
+echo
+echo '== describe'
+"$cliphost" describe "$@" --use-alpha --out-dir "$out/aaf" || status=$?
+
+echo
+echo "AAF files are in $out/aaf; any program that reads AAF opens them."
+exit $status
