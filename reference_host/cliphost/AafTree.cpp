@@ -165,8 +165,18 @@ TreeNode ReadTree(IAAFFile* file) {
 
 namespace {
 
+// The name of a data definition without the prefix and id that all have.
+std::string ShortDefinition(const std::string& value) {
+    static const std::string kPrefix = "DataDef_";
+    const std::size_t start = value.compare(0, kPrefix.size(), kPrefix) == 0 ? kPrefix.size() : 0;
+    return value.substr(start, value.find(" {") - start);
+}
+
 void ReplaceIds(TreeNode& node, const std::map<std::string, std::string>& numbers) {
     for (TreeNode::Fact& fact : node.facts) {
+        if (fact.name == "DataDefinition") {
+            fact.value = ShortDefinition(fact.value);
+        }
         const auto found = fact.name == "SourceID" ? numbers.find(fact.value) : numbers.end();
         if (found != numbers.end()) {
             fact.value = found->second;
