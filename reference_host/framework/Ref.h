@@ -26,6 +26,8 @@ public:
     // A component's reference held as one of its interfaces.
     template <class Derived>
     Ref(const Ref<Derived>& other) : Ref(static_cast<T*>(other.get())) {}
+    template <class Derived>
+    Ref(Ref<Derived>&& other) : object_(other.Detach()) {}
     ~Ref() { Reset(); }
 
     Ref& operator=(Ref other) noexcept {

@@ -226,15 +226,17 @@ private:
 
 }  // namespace
 
+// Called under the tree's lock, so no reference may be given back here.
+
 Ref<IXmlNode> MakeNodeObject(std::shared_ptr<XmlTree> tree, pugi::xml_node node) {
     if (node.type() == pugi::node_element) {
-        return MakeRef<ElementObject>(std::move(tree), node);
+        return Ref<IXmlNode>::Adopt(new ElementObject(std::move(tree), node));
     }
-    return MakeRef<PlainObject>(std::move(tree), node);
+    return Ref<IXmlNode>::Adopt(new PlainObject(std::move(tree), node));
 }
 
 Ref<IXmlNode> MakeAttributeObject(std::shared_ptr<XmlTree> tree, pugi::xml_attribute attribute) {
-    return MakeRef<AttributeObject>(std::move(tree), attribute);
+    return Ref<IXmlNode>::Adopt(new AttributeObject(std::move(tree), attribute));
 }
 
 }  // namespace host
