@@ -30,6 +30,21 @@ bool ReadContent(INCFString* string, std::string& out) {
     return IsXmlContent(text) && text::ToUtf8(text, out);
 }
 
+// A carriage return that stands bare in a text is a line feed to every reader;
+// everywhere else the printer escapes it.
+std::string KeepReturns(const std::string& printed) {
+    std::string out;
+    out.reserve(printed.size());
+    for (const char c : printed) {
+        if (c == '\r') {
+            out += "&#13;";
+        } else {
+            out.push_back(c);
+        }
+    }
+    return out;
+}
+
 }  // namespace
 
 struct XmlWriter::Tree {
@@ -54,7 +69,7 @@ struct XmlWriter::Tree {
         stream << kDeclaration;
         document.save(stream, "", pugi::format_raw | pugi::format_no_declaration,
                       pugi::encoding_utf8);
-        return stream.str();
+        return KeepReturns(stream.str());
     }
 };
 
