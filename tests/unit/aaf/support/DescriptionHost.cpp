@@ -91,7 +91,7 @@ void DescriptionHost::StartRetriever() {
         NCF_OK);
 }
 
-void DescriptionHost::MakeNative(const char (&code)[5]) {
+void DescriptionHost::MakeNative(const char* code) {
     clip->askRetriever = true;
     clip->code = 0;
     for (int i = 0; i < 4; ++i) {

@@ -26,7 +26,7 @@ protected:
     // Loads the data files, as the first description with video does.
     void StartRetriever();
     // A clip that the data files say everything about.
-    void MakeNative(const char (&fourCharacters)[5]);
+    void MakeNative(const char* fourCharacters);
 
     NCFSmartPtr<INCFConsole> Console() { return NCFSmartPtr<INCFConsole>(&host.console()); }
     std::tr1::shared_ptr<BaseClip> Media() { return clip; }

@@ -58,6 +58,9 @@ public:
         return static_cast<Interface*>(dictionaryFace(aafIdOf((const Interface*)nullptr)));
     }
 
+    // As the library does; a test may look past it.
+    bool refusesNegativeLengths = true;
+
     int liveObjects() const { return live_; }
     // What the module told the library when it opened the last file.
     const std::string& lastIdentification() const { return identification_; }

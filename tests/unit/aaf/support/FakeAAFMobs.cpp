@@ -207,7 +207,11 @@ struct FillerFace final : FakeAAFFace<IAAFFiller> {
     using FakeAAFFace::FakeAAFFace;
     HRESULT Initialize(IAAFDataDef* kind, aafLength_t length) override {
         const HRESULT refused = note("Initialize", (IUnknown*)kind, length);
-        return refused ? refused : length < 0 ? AAFRESULT_BAD_LENGTH : AAFRESULT_SUCCESS;
+        if (refused) {
+            return refused;
+        }
+        const bool bad = length < 0 && self_.library().refusesNegativeLengths;
+        return bad ? AAFRESULT_BAD_LENGTH : AAFRESULT_SUCCESS;
     }
 };
 

@@ -122,7 +122,9 @@ std::string Shown(const aafTimecode_t& timecode) {
 std::string Shown(aafCharacter_constptr text) {
     std::string shown = "'";
     for (; *text; ++text) {
-        shown += *text < 0x80 ? static_cast<char>(*text) : '?';
+        char code[12];
+        std::snprintf(code, sizeof code, "<%04X>", static_cast<unsigned>(*text));
+        shown += *text < 0x80 ? std::string(1, static_cast<char>(*text)) : code;
     }
     return shown + "'";
 }

@@ -1,0 +1,160 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include <chrono>
+#include <filesystem>
+
+#include "source/aaf/Timecode.h"
+#include "tests/unit/aaf/support/AAFTest.h"
+
+namespace NMA::Impl {
+namespace {
+
+constexpr char kFunction[] = "NMA::Impl::AddSyntheticTimeCode";
+
+class SyntheticTimecodeTest : public AAFTest {
+protected:
+    SyntheticTimecodeTest() { clip->setTiming(); }
+
+    // Gives the clip a file that was written at a time of a day in UTC.
+    void MakeFile(int hour, int minute, int second) {
+        using namespace std::chrono;
+        const std::string path = Write("a clip.mov", "bytes");
+        // 2001-09-09, a Sunday.
+        const auto since1970 = hours(24) * 11574 + hours(hour) + minutes(minute) + seconds(second);
+        const auto onSystemClock = system_clock::time_point(since1970);
+        std::filesystem::last_write_time(
+            path, std::filesystem::file_time_type::clock::now() +
+                      duration_cast<std::filesystem::file_time_type::duration>(
+                          onSystemClock - system_clock::now()));
+        INCFString* const name = MakeHostString(path);
+        clip->setFileName(name);
+        name->Release();
+    }
+    NCFRESULT Add() { return AddSyntheticTimeCode(Media(), &slots, Console(), Dictionary(), mob); }
+    ncfUInt32 slots = 0;
+    IAAFSmartPointer<IAAFMob> mob = Make<IAAFMob>("SourceMob");
+};
+
+TEST_F(SyntheticTimecodeTest, MakesAMainAndAnAuxiliarySlotFromTheFilesDate) {
+    MakeFile(1, 2, 3);
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(slots, 2u);
+    EXPECT_TRUE(aaf.has("Timecode1.Initialize 0 {0 drop 0 fps 25}"));
+    EXPECT_TRUE(aaf.has("Timecode1.SetLength 2160000"));
+    EXPECT_TRUE(aaf.has("SourceMob1.AppendNewTimelineSlot 25/1 Sequence1 1 'TC1' 0"));
+    EXPECT_TRUE(aaf.has("SourceMob1Slot1.SetPhysicalNum 1"));
+    const int frames = ((1 * 60 + 2) * 60 + 3) * 25;  // no frames are dropped at 25
+    EXPECT_TRUE(aaf.has("Timecode2.Initialize 0 {" + std::to_string(frames) + " drop 1 fps 25}"));
+    EXPECT_TRUE(aaf.has("Timecode2.SetLength 100"));
+    EXPECT_TRUE(aaf.has("SourceMob1.AppendNewTimelineSlot 25/1 Sequence2 2 'AuxTC1' 0"));
+    EXPECT_TRUE(aaf.has("SourceMob1Slot2.SetPhysicalNum 3"));
+    EXPECT_TRUE(aaf.has("Filler1.Initialize DataDef1 0"));
+    EXPECT_TRUE(aaf.has("Filler2.Initialize DataDef1 " + std::to_string(2160000 - 100)));
+}
+
+TEST_F(SyntheticTimecodeTest, TellsTheDateInUtcToTheConsole) {
+    MakeFile(23, 59, 58);
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(
+        host.console().count(4, "Modification Date is day 9, hour 23, minute 59, second 58\n\n"),
+        1);
+}
+
+TEST_F(SyntheticTimecodeTest, CountsTheTimeOfDayAsDropFrame) {
+    clip->rate = {30000, 1001};
+    clip->setTiming();
+    MakeFile(1, 0, 0);
+    ASSERT_EQ(Add(), NCF_OK);
+    // An hour of 30 frames a second drops 108 numbers.
+    EXPECT_TRUE(aaf.has("Timecode2.Initialize 0 {107892 drop 1 fps 30}"));
+    EXPECT_TRUE(aaf.has("Timecode1.SetLength 2592000"));
+}
+
+TEST_F(SyntheticTimecodeTest, ADateThatCannotBeReadIsMidnight) {
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(slots, 2u);
+    EXPECT_TRUE(aaf.has("Timecode2.Initialize 0 {0 drop 1 fps 25}"));
+    EXPECT_EQ(host.console().count(4, "Modification Date is day 0, hour 0, minute 0, second 0\n\n"),
+              1);
+    EXPECT_TRUE(log.contains(std::string(kFunction) + " - FileTimeToSystemTime, hresult: "));
+}
+
+TEST_F(SyntheticTimecodeTest, AfterOtherSlotsTheMainSlotsFillerEndsTheClip) {
+    slots = 1;
+    EXPECT_EQ(Add(), NCF_E_FAIL);
+    EXPECT_TRUE(aaf.has("Filler2.Initialize DataDef1 -2160000"));
+}
+
+TEST_F(SyntheticTimecodeTest, AfterOtherSlotsTheLabelsFollowTheCounter) {
+    aaf.refusesNegativeLengths = false;
+    slots = 1;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(slots, 3u);
+    EXPECT_TRUE(aaf.has("SourceMob1.AppendNewTimelineSlot 25/1 Sequence1 2 'AuxTC1' 0"));
+    EXPECT_TRUE(aaf.has("SourceMob1.AppendNewTimelineSlot 25/1 Sequence2 3 'AuxTC2' 0"));
+}
+
+TEST_F(SyntheticTimecodeTest, ChecksItsArgumentsInOrder) {
+    const std::tr1::shared_ptr<BaseClip> none;
+    EXPECT_EQ(AddSyntheticTimeCode(none, nullptr, nullptr, nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(AddSyntheticTimeCode(Media(), nullptr, nullptr, nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(AddSyntheticTimeCode(Media(), &slots, nullptr, nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(AddSyntheticTimeCode(Media(), &slots, Console(), nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(AddSyntheticTimeCode(Media(), &slots, Console(), Dictionary(), nullptr),
+              NCF_E_POINTER);
+    std::vector<std::string> texts;
+    for (const LoggedRecord& record : log.records()) {
+        texts.push_back(record.text);
+    }
+    EXPECT_EQ(texts,
+              (std::vector<std::string>{std::string("CHK_PTR(media.get())") + kFunction,
+                                        std::string("CHK_PTR(totalExistingSlots)") + kFunction,
+                                        std::string("CHK_PTR(pConsole)") + kFunction,
+                                        std::string("CHK_PTR(pDictionary)") + kFunction,
+                                        std::string("CHK_PTR(pMobSourceMob)") + kFunction}));
+}
+
+TEST_F(SyntheticTimecodeTest, NeedsRateAndLength) {
+    clip->failures["GetEditRate"] = NMA_E_NOTINITIALIZED;
+    EXPECT_EQ(Add(), NMA_E_NOTINITIALIZED);
+    clip->failures = {{"GetMovieLength", NMA_E_NOTINITIALIZED}};
+    EXPECT_EQ(Add(), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(log.count(ReturnRecord(NMA_E_NOTINITIALIZED, "media->GetMovieLength(&movieLength)",
+                                     kFunction)),
+              1);
+}
+
+TEST_F(SyntheticTimecodeTest, ARateThatRoundsToNothingIsRefused) {
+    clip->rate = {1, 3};
+    clip->setTiming();
+    EXPECT_EQ(Add(), NCF_E_INVALIDARG);
+    EXPECT_EQ(log.count(ReturnRecord(NCF_E_INVALIDARG,
+                                     "ConvertTCToFrames( pUTCTime->tm_hour, pUTCTime->tm_min, "
+                                     "pUTCTime->tm_sec, 0, numFPS, TRUE, &tcInFrames)",
+                                     kFunction)),
+              1);
+}
+
+TEST_F(SyntheticTimecodeTest, LogsTheSlotThatFailed) {
+    aaf.refuse("SourceMob1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY, 1);
+    EXPECT_EQ(Add(), NMA_E_AAF_ADD);
+    EXPECT_EQ(log.count(ReturnRecord(
+                  NMA_E_AAF_ADD,
+                  "AddTimecodeAAFTrack( timecode, tcTrackNum++, (*totalExistingSlots)++, "
+                  "aafEditRate, maxDuration, 0, 0, pDictionary, pMobSourceMob)",
+                  kFunction)),
+              1);
+    slots = 0;
+    aaf.refuse("SourceMob1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY, 2);
+    EXPECT_EQ(Add(), NMA_E_AAF_ADD);
+    EXPECT_EQ(log.count(ReturnRecord(
+                  NMA_E_AAF_ADD,
+                  "AddTimecodeAAFTrack( auxTimecode, tcTrackNum, (*totalExistingSlots)++, "
+                  "aafEditRate, movieLength, maxDuration, 0, pDictionary, pMobSourceMob)",
+                  kFunction)),
+              1);
+}
+
+}  // namespace
+}  // namespace NMA::Impl

@@ -1,0 +1,528 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "source/aaf/VideoDescriptor.h"
+
+#include "tests/unit/aaf/support/AAFTest.h"
+
+namespace NMA::Impl {
+namespace {
+
+constexpr char kFunction[] = "NMA::Impl::AddVideoDescriptor";
+
+class VideoDescriptorTest : public AAFTest {
+protected:
+    VideoDescriptorTest() {
+        StartRetriever();
+        clip->setTiming();
+    }
+    NCFRESULT Add() {
+        return AddVideoDescriptor(Media(), Console(), mob, header, Dictionary(), multi);
+    }
+    // Calls of a method on any object.
+    bool Called(const std::string& method) const { return aaf.journal().contains("." + method); }
+
+    IAAFSmartPointer<IAAFMob> mob = Make<IAAFMob>("MasterMob");
+    IAAFSmartPointer<IAAFHeader> header = Make<IAAFHeader>("Header");
+    IAAFSmartPointer<IAAFMultipleDescriptor> multi =
+        Make<IAAFMultipleDescriptor>("MultipleDescriptor");
+};
+
+TEST_F(VideoDescriptorTest, ChecksItsArgumentsInOrder) {
+    const std::tr1::shared_ptr<BaseClip> none;
+    EXPECT_EQ(AddVideoDescriptor(none, nullptr, nullptr, nullptr, nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(AddVideoDescriptor(Media(), nullptr, nullptr, nullptr, nullptr, nullptr),
+              NCF_E_POINTER);
+    EXPECT_EQ(AddVideoDescriptor(Media(), Console(), nullptr, nullptr, nullptr, nullptr),
+              NCF_E_POINTER);
+    EXPECT_EQ(AddVideoDescriptor(Media(), Console(), mob, nullptr, nullptr, nullptr),
+              NCF_E_POINTER);
+    EXPECT_EQ(AddVideoDescriptor(Media(), Console(), mob, header, nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(AddVideoDescriptor(Media(), Console(), mob, header, Dictionary(), nullptr),
+              NCF_E_POINTER);
+    std::vector<std::string> texts;
+    for (const LoggedRecord& record : log.records()) {
+        texts.push_back(record.text);
+    }
+    std::vector<std::string> expected;
+    for (const char* name : {"media.get()", "pConsole", "pMobMasterMob", "pHeader", "pDictionary",
+                             "pMultiDescriptor"}) {
+        expected.push_back(std::string("CHK_PTR(") + name + ")" + kFunction);
+    }
+    EXPECT_EQ(texts, expected);
+}
+
+TEST_F(VideoDescriptorTest, TheSampleProviderRoadInOrder) {
+    ASSERT_EQ(Add(), NCF_OK);
+    std::vector<std::string> calls;
+    for (const std::string& line : aaf.journal().lines()) {
+        if (line.find("QueryInterface") == std::string::npos) {
+            calls.push_back(line);
+        }
+        if (line.find("SetLength") != std::string::npos) {
+            break;
+        }
+    }
+    EXPECT_EQ(calls, (std::vector<std::string>{
+                         "Dictionary.CreateInstance CDCIDescriptor",
+                         "CDCIDescriptor1.Initialize",
+                         "MasterMob1.AppendComment 'Video' 'H.264'",
+                         "MasterMob1.AppendComment 'Image Aspect Ratio' '16:9'",
+                         "CDCIDescriptor1.SetBlackReferenceLevel 0",
+                         "CDCIDescriptor1.SetWhiteReferenceLevel 255",
+                         "MasterMob1.AppendComment 'Video File Format' 'MOV'",
+                         "CDCIDescriptor1.SetCompression 0E040201-027F-0000-060E-2B3404010101",
+                         "Dictionary.LookupContainerDef 060E2B34-0401-0101-0E04-040102010100",
+                         "Dictionary.CreateInstance ContainerDef",
+                         "ContainerDef1.Initialize 060E2B34-0401-0101-0E04-040102010100 '' ''",
+                         "Dictionary.RegisterContainerDef ContainerDef1",
+                         "CDCIDescriptor1.SetContainerFormat ContainerDef1",
+                         "CDCIDescriptor1.SetFrameLayout 0",
+                         "CDCIDescriptor1.SetStoredView 1080 1920",
+                         "CDCIDescriptor1.SetSampledView 1080 0 0 0",
+                         "CDCIDescriptor1.SetDisplayView 1080 1920 0 0",
+                         "CDCIDescriptor1.SetImageAspectRatio 16/9",
+                         "CDCIDescriptor1.SetSampleRate 25/1",
+                         "CDCIDescriptor1.SetLength 100"}));
+    const std::vector<std::string>& all = aaf.journal().lines();
+    EXPECT_EQ(std::vector<std::string>(all.end() - 3, all.end()),
+              (std::vector<std::string>{
+                  "MultipleDescriptor1.GetSampleRate", "MultipleDescriptor1.SetSampleRate 25/1",
+                  "MultipleDescriptor1.AppendFileDescriptor CDCIDescriptor1"}));
+}
+
+TEST_F(VideoDescriptorTest, AProviderClipHasNoComponentValues) {
+    ASSERT_EQ(Add(), NCF_OK);
+    for (const char* method :
+         {"SetVideoLineMap", "SetFieldStartOffset", "SetComponentWidth", "SetHorizontalSubsampling",
+          "SetVerticalSubsampling", "SetColorSiting", "SetColorRange", "SetMaxGOP",
+          "SetPixelLayout", "CreateValue ["}) {
+        EXPECT_FALSE(Called(method)) << method;
+    }
+}
+
+TEST_F(VideoDescriptorTest, AskTheClipInOrder) {
+    journal.clear();
+    ASSERT_EQ(Add(), NCF_OK);
+    std::vector<std::string> asked = journal.startingWith("clip ");
+    EXPECT_EQ(asked,
+              (std::vector<std::string>{"clip IsVideoSampleProviderMedia", "clip GetDataFormat",
+                                        "clip GetCodecName", "clip GetEncodedWidthAndHeight",
+                                        "clip GetImageAspectRatio", "clip GetNMAFrameLayout",
+                                        "clip GetColorDetails", "clip GetEditRate",
+                                        "clip GetMovieLength", "clip GetGeometryDetails"}));
+}
+
+struct LayoutCase {
+    ncfUInt32 width;
+    ncfUInt32 height;
+    NCFRESULT result;
+    ncfUInt32 layout;
+    int expectedLayout;
+    int expectedHeight;
+};
+
+class FrameLayoutTest : public VideoDescriptorTest,
+                        public ::testing::WithParamInterface<LayoutCase> {};
+
+TEST_P(FrameLayoutTest, HalvesTheHeightOfSeparateFields) {
+    const LayoutCase& given = GetParam();
+    clip->pictureWidth = given.width;
+    clip->pictureHeight = given.height;
+    clip->layoutResult = given.result;
+    clip->layout = given.layout;
+    ASSERT_EQ(Add(), NCF_OK);
+    const std::string height = std::to_string(given.expectedHeight);
+    const std::string width = std::to_string(given.width);
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetFrameLayout " + std::to_string(given.expectedLayout)));
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetStoredView " + height + " " + width));
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetSampledView " + height + " 0 0 0"));
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetDisplayView " + height + " " + width + " 0 0"));
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Rasters, FrameLayoutTest,
+    ::testing::Values(LayoutCase{1920, 1080, NCF_OK, 0, 0, 1080},
+                      LayoutCase{1920, 1080, NCF_OK, 1, 1, 540},
+                      LayoutCase{720, 486, NCF_E_PARAMETERNOTAVAILABLE, 0, 1, 243},
+                      LayoutCase{720, 576, NCF_E_PARAMETERNOTAVAILABLE, 0, 1, 288},
+                      LayoutCase{720, 480, NCF_E_PARAMETERNOTAVAILABLE, 0, 0, 480},
+                      LayoutCase{704, 576, NCF_E_PARAMETERNOTAVAILABLE, 0, 0, 576},
+                      LayoutCase{1920, 1080, NCF_E_PARAMETERNOTAVAILABLE, 0, 0, 1080},
+                      LayoutCase{720, 486, NCF_OK, 0, 0, 486},
+                      LayoutCase{1920, 1081, NCF_OK, 1, 1, 540}));
+
+TEST_F(VideoDescriptorTest, AnyOtherLayoutAnswerIsReturnedWithoutALogLine) {
+    for (const NCFRESULT answer : {NCF_E_FAIL, NCFRESULT(1)}) {
+        clip->layoutResult = answer;
+        EXPECT_EQ(Add(), answer);
+    }
+    EXPECT_FALSE(log.contains("GetNMAFrameLayout"));
+}
+
+TEST_F(VideoDescriptorTest, APictureOfNoSizeIsRefused) {
+    clip->pictureHeight = 1;
+    clip->layout = 1;
+    EXPECT_EQ(Add(), NCF_E_FAIL);
+    EXPECT_EQ(log.count(std::string("NCFASSERT( aafInfo.displayHeight && aafInfo.displayWidth )") +
+                        kFunction),
+              1);
+    clip->layout = 0;
+    clip->pictureWidth = 0;
+    EXPECT_EQ(Add(), NCF_E_FAIL);
+}
+
+TEST_F(VideoDescriptorTest, ANativePictureIsDescribedByItsRecord) {
+    MakeNative("cdci");
+    ASSERT_EQ(Add(), NCF_OK);
+    for (const char* call :
+         {"CDCIDescriptor1.SetFieldStartOffset 8", "CDCIDescriptor1.SetVideoLineMap 42 7",
+          "CDCIDescriptor1.SetComponentWidth 10", "CDCIDescriptor1.SetHorizontalSubsampling 2",
+          "CDCIDescriptor1.SetVerticalSubsampling 1", "CDCIDescriptor1.SetColorSiting 4",
+          "CDCIDescriptor1.SetColorRange 897", "CDCIDescriptor1.SetBlackReferenceLevel 64",
+          "CDCIDescriptor1.SetWhiteReferenceLevel 940", "CDCIDescriptor1.SetStoredView 1088 1920",
+          "CDCIDescriptor1.SetSampledView 1088 1918 0 0",
+          "CDCIDescriptor1.SetDisplayView 1080 1900 0 4",
+          "CDCIDescriptor1.SetImageAspectRatio 16/9",
+          "CDCIDescriptor1.SetCompression 04010202-0306-0100-060E-2B340401010D",
+          "Dictionary.LookupContainerDef 0D010301-021C-0100-060E-2B340401010D",
+          "MasterMob1.AppendComment 'Video File Format' 'MOV'"}) {
+        EXPECT_TRUE(aaf.has(call)) << call;
+    }
+    EXPECT_EQ(aaf.place("MasterMob1.AppendComment 'Video' "), -1);
+    EXPECT_EQ(aaf.place("MasterMob1.AppendComment 'Image Aspect Ratio'"), -1);
+    EXPECT_LT(aaf.place("CDCIDescriptor1.SetFieldStartOffset"),
+              aaf.place("CDCIDescriptor1.SetVideoLineMap"));
+    EXPECT_LT(aaf.place("CDCIDescriptor1.SetVideoLineMap"),
+              aaf.place("CDCIDescriptor1.SetComponentWidth"));
+}
+
+TEST_F(VideoDescriptorTest, ARecordWithSlicesHasTheirCount) {
+    MakeNative("cdci");
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetPropertyValue PropertyAVCISliceCount1 Value1"));
+    // The count stands before the boxes.
+    EXPECT_LT(aaf.place("CDCIDescriptor1.SetPropertyValue PropertyAVCISliceCount1"),
+              aaf.place("CDCIDescriptor1.SetPropertyValue PropertyEssenceBox1"));
+}
+
+TEST_F(VideoDescriptorTest, ARecordWithoutSlicesHasNone) {
+    MakeNative("mpeg");
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_FALSE(Called("SetPropertyValue PropertyAVCISliceCount"));
+}
+
+TEST_F(VideoDescriptorTest, AnMpegPictureHasTheClassOfItsOwnSeenAsComponents) {
+    MakeNative("mpeg");
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(aaf.linesOf("MPEGVideoDescriptor1").at(0), "MPEGVideoDescriptor1.InitializeMPEG");
+    EXPECT_EQ(aaf.linesOf("MPEGVideoDescriptor1").at(1), "MPEGVideoDescriptor1.SetMaxGOP 12");
+    EXPECT_EQ(aaf.linesOf("MPEGVideoDescriptor1").at(2),
+              "MPEGVideoDescriptor1.SetBitRate 50000000");
+    EXPECT_EQ(aaf.linesOf("MPEGVideoDescriptor1").at(3),
+              "MPEGVideoDescriptor1.SetProfileAndLevel 130");
+    EXPECT_EQ(aaf.linesOf("MPEGVideoDescriptor1").at(5), "MPEGVideoDescriptor1.Initialize");
+    EXPECT_TRUE(aaf.has("MPEGVideoDescriptor1.SetComponentWidth 10"));
+    EXPECT_EQ(aaf.place("Dictionary.CreateInstance CDCIDescriptor"), -1);
+}
+
+TEST_F(VideoDescriptorTest, AnRgbaPictureHasAPixelLayoutAndItsOwnLevels) {
+    MakeNative("rgba");
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("RGBADescriptor1.SetPixelLayout 82x8 71x8 66x8"));
+    EXPECT_TRUE(aaf.has("RGBADescriptor1.SetComponentMinRef 1"));
+    EXPECT_TRUE(aaf.has("RGBADescriptor1.SetComponentMaxRef 254"));
+    EXPECT_LT(aaf.place("RGBADescriptor1.SetComponentMinRef"),
+              aaf.place("RGBADescriptor1.SetComponentMaxRef"));
+    EXPECT_FALSE(Called("SetComponentWidth"));
+    EXPECT_FALSE(Called("SetBlackReferenceLevel"));
+    EXPECT_EQ(aaf.place("RGBADescriptor1.Initialize"), -1);
+}
+
+TEST_F(VideoDescriptorTest, AProviderClipAfterAnRgbaClipFails) {
+    MakeNative("rgba");
+    ASSERT_EQ(Add(), NCF_OK);
+    clip->askRetriever = false;
+    try {
+        Add();
+        FAIL() << "the missing RGBA object was not noticed";
+    } catch (const char* text) {
+        EXPECT_STREQ(text, "_rep");
+    }
+}
+
+TEST_F(VideoDescriptorTest, TheClipsLevelsWinWhenBothAreGiven) {
+    clip->color().refBlack = 4;
+    clip->color().refWhite = 1019;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetBlackReferenceLevel 4"));
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetWhiteReferenceLevel 1019"));
+}
+
+TEST_F(VideoDescriptorTest, OneLevelOfTheClipIsNotEnough) {
+    clip->color().refBlack = 4;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetBlackReferenceLevel 0"));
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetWhiteReferenceLevel 255"));
+}
+
+TEST_F(VideoDescriptorTest, TheClipsLevelsGoToAnRgbaDescriptorToo) {
+    MakeNative("rgba");
+    clip->color().refBlack = 16;
+    clip->color().refWhite = 235;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("RGBADescriptor1.SetComponentMinRef 16"));
+    EXPECT_TRUE(aaf.has("RGBADescriptor1.SetComponentMaxRef 235"));
+}
+
+TEST_F(VideoDescriptorTest, AVendorsMetadataIsToldAndLabelled) {
+    clip->color().hasVendorMetadata = true;
+    clip->color().transferCharacteristicUID = ncfGuid("0E170000-0001-0101-060E-2B340401010C");
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(host.console().count(
+                  4, "Supported vendor found. Filling vendor-specific metadata into AAF\n"),
+              1);
+    EXPECT_TRUE(
+        aaf.has("CDCIDescriptor1.SetTransferCharacteristic 0E170000-0001-0101-060E-2B340401010C"));
+    EXPECT_FALSE(Called("SetColorPrimaries"));
+}
+
+TEST_F(VideoDescriptorTest, CodesOfTheColourAtomAreLabelled) {
+    clip->color().transferFunction = 1;
+    clip->color().colorPrimaries = 6;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(Called("SetTransferCharacteristic 04010101-0102-0000-060E-2B3404010101"));
+    EXPECT_TRUE(Called("SetColorPrimaries 04010101-0301-0000-060E-2B3404010106"));
+}
+
+TEST_F(VideoDescriptorTest, AKnownContainerIsNotRegisteredAgain) {
+    ASSERT_EQ(Add(), NCF_OK);
+    aaf.clearJournal();
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(aaf.place("Dictionary.RegisterContainerDef"), -1);
+    EXPECT_TRUE(aaf.has("CDCIDescriptor2.SetContainerFormat ContainerDef1"));
+}
+
+TEST_F(VideoDescriptorTest, ASecondDescriptorIsLikeTheFirst) {
+    MakeNative("cdci");
+    ASSERT_EQ(Add(), NCF_OK);
+    std::vector<std::string> first = aaf.linesOf("CDCIDescriptor1.Set");
+    ASSERT_EQ(Add(), NCF_OK);
+    std::vector<std::string> second = aaf.linesOf("CDCIDescriptor2.Set");
+    ASSERT_EQ(first.size(), second.size());
+    for (std::size_t i = 0; i < first.size(); ++i) {
+        if (first[i].find("SetPropertyValue") == std::string::npos) {
+            EXPECT_EQ(first[i].substr(15), second[i].substr(15));
+        }
+    }
+    EXPECT_EQ(aaf.journal().count("MasterMob1.AppendComment 'Video File Format' 'MOV'"), 2);
+    EXPECT_EQ(aaf.linesOf("MultipleDescriptor1.SetSampleRate").size(), 1u);
+    EXPECT_TRUE(aaf.has("MultipleDescriptor1.AppendFileDescriptor CDCIDescriptor2"));
+}
+
+TEST_F(VideoDescriptorTest, AnEmptyLineMapIsTheLibrarysToRefuse) {
+    clip->nativePicture = 1;
+    clip->record.displayHeight = clip->record.displayWidth = 10;
+    EXPECT_EQ(Add(), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NULL_PARAM,
+                                     "pDigitalImageDescriptor->SetVideoLineMap( "
+                                     "(aafUInt32)aafInfo.videoLineMapVect.size(), "
+                                     "(aafInt32*)&aafInfo.videoLineMapVect[0] )",
+                                     kFunction)),
+              1);
+}
+
+TEST_F(VideoDescriptorTest, AFailedPolicyIsReturnedAsItStands) {
+    for (const NCFRESULT answer : {NCF_E_HANDLE, NCFRESULT(2)}) {
+        clip->failures["IsVideoSampleProviderMedia"] = answer;
+        EXPECT_EQ(Add(), answer);
+    }
+    EXPECT_EQ(aaf.callCount(), 0);
+}
+
+TEST_F(VideoDescriptorTest, FailuresOfTheClipAreLoggedAndReturned) {
+    const std::pair<const char*, const char*> statements[] = {
+        {"GetDataFormat", "AddVideoBinColumnEntry(media, pMobMasterMob, pConsole)"},
+        {"GetEncodedWidthAndHeight", "media->GetEncodedWidthAndHeight(&movieWidth, &movieHeight)"},
+        {"GetImageAspectRatio",
+         "media->GetImageAspectRatio(&pictAspectRatioNumerator, &pictAspectRatioDenominator)"},
+        {"GetColorDetails", "media->GetColorDetails(&colorDetails)"},
+        {"GetEditRate", "media->GetEditRate(&movieEditRate)"},
+        {"GetMovieLength", "media->GetMovieLength(&movieLength)"},
+        {"GetGeometryDetails", "media->GetGeometryDetails(&geometryDetails)"},
+    };
+    for (const auto& [operation, statement] : statements) {
+        clip->failures = {{operation, NCF_E_NOTFOUND}};
+        EXPECT_EQ(Add(), NCF_E_NOTFOUND) << operation;
+        EXPECT_EQ(log.count(ReturnRecord(NCF_E_NOTFOUND, statement, kFunction)), 1) << operation;
+    }
+}
+
+struct RefusedCall {
+    const char* code;
+    const char* call;
+    const char* statement;
+};
+
+class VideoRefusalTest : public VideoDescriptorTest,
+                         public ::testing::WithParamInterface<RefusedCall> {};
+
+TEST_P(VideoRefusalTest, IsLoggedWithItsStatementAndReturned) {
+    const RefusedCall& refused = GetParam();
+    if (*refused.code) {
+        MakeNative(refused.code);
+    }
+    if (std::string(refused.statement).find("colorDetails.ref") != std::string::npos) {
+        clip->color().refBlack = 1;
+        clip->color().refWhite = 2;
+    }
+    aaf.refuse(refused.call, AAFRESULT_NOMEMORY);
+    EXPECT_EQ(Add(), AAFRESULT_NOMEMORY);
+    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, refused.statement, kFunction)), 1);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    EveryCall, VideoRefusalTest,
+    ::testing::Values(
+        RefusedCall{"", "Dictionary.CreateInstance CDCIDescriptor",
+                    "pDictionary->CreateInstance(AUID_AAFCDCIDescriptor, IID_IAAFCDCIDescriptor, "
+                    "(IUnknown**)&pCDCIDescriptor)"},
+        RefusedCall{"", "CDCIDescriptor1.Initialize", "pCDCIDescriptor->Initialize()"},
+        RefusedCall{"", "CDCIDescriptor1.QueryInterface 44861701",
+                    "pCDCIDescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor, (void "
+                    "**)&pDigitalImageDescriptor)"},
+        RefusedCall{"", "CDCIDescriptor1.QueryInterface F7B9D3BE",
+                    "pCDCIDescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor2, (void "
+                    "**)&pDigitalImageDescriptor2)"},
+        RefusedCall{"mpeg", "ClassDefMPEGVideoDescriptor1.CreateInstance",
+                    "defs.cdMPEGVideoDescriptor()->CreateInstance(IID_IAAFMPEGVideoDescriptor, "
+                    "(IUnknown **)&pMPEGDescriptor)"},
+        RefusedCall{"mpeg", "MPEGVideoDescriptor1.InitializeMPEG", "pMPEGDescriptor->Initialize()"},
+        RefusedCall{"mpeg", "MPEGVideoDescriptor1.SetMaxGOP",
+                    "pMPEGDescriptor->SetMaxGOP((aafUInt16)aafInfo.maxGOP)"},
+        RefusedCall{"mpeg", "MPEGVideoDescriptor1.SetBitRate",
+                    "pMPEGDescriptor->SetBitRate(aafInfo.bitRate)"},
+        RefusedCall{"mpeg", "MPEGVideoDescriptor1.SetProfileAndLevel",
+                    "pMPEGDescriptor->SetProfileAndLevel(aafInfo.levelAndProfile)"},
+        RefusedCall{"mpeg", "MPEGVideoDescriptor1.QueryInterface 44861703",
+                    "pMPEGDescriptor->QueryInterface(IID_IAAFCDCIDescriptor, "
+                    "(void**)&pCDCIDescriptor)"},
+        RefusedCall{"rgba", "ClassDefRGBADescriptor1.CreateInstance",
+                    "defs.cdRGBADescriptor()->CreateInstance(IID_IAAFRGBADescriptor2, (IUnknown "
+                    "**)&pRGBADescriptor)"},
+        RefusedCall{"rgba", "RGBADescriptor1.QueryInterface 44861701",
+                    "pRGBADescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor, (void "
+                    "**)&pDigitalImageDescriptor)"},
+        RefusedCall{"rgba", "RGBADescriptor1.QueryInterface F7B9D3BE",
+                    "pRGBADescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor2, (void "
+                    "**)&pDigitalImageDescriptor2)"},
+        RefusedCall{"rgba", "RGBADescriptor1.SetPixelLayout",
+                    "pRGBADescriptor->SetPixelLayout((aafUInt32)aafInfo.pixelLayout.size(),"
+                    "&aafInfo.pixelLayout[0])"},
+        RefusedCall{"rgba", "RGBADescriptor1.SetComponentMinRef",
+                    "pRGBADescriptor->SetComponentMinRef( aafInfo.blackRefLevel )"},
+        RefusedCall{"rgba", "RGBADescriptor1.SetComponentMaxRef",
+                    "pRGBADescriptor->SetComponentMaxRef( aafInfo.whiteRefLevel )"},
+        RefusedCall{"rgba", "RGBADescriptor1.SetComponentMinRef",
+                    "pRGBADescriptor->SetComponentMinRef( colorDetails.refBlack )"},
+        RefusedCall{"rgba", "RGBADescriptor1.SetComponentMaxRef",
+                    "pRGBADescriptor->SetComponentMaxRef( colorDetails.refWhite )"},
+        RefusedCall{"cdci", "CDCIDescriptor1.SetFieldStartOffset",
+                    "pDigitalImageDescriptor2->SetFieldStartOffset( aafInfo.ImageStartOffset )"},
+        RefusedCall{"cdci", "CDCIDescriptor1.SetVideoLineMap",
+                    "pDigitalImageDescriptor->SetVideoLineMap( "
+                    "(aafUInt32)aafInfo.videoLineMapVect.size(), "
+                    "(aafInt32*)&aafInfo.videoLineMapVect[0] )"},
+        RefusedCall{"cdci", "CDCIDescriptor1.SetComponentWidth",
+                    "pCDCIDescriptor->SetComponentWidth( aafInfo.componentDepth )"},
+        RefusedCall{"cdci", "CDCIDescriptor1.SetHorizontalSubsampling",
+                    "pCDCIDescriptor->SetHorizontalSubsampling( aafInfo.horizontalSubsampling )"},
+        RefusedCall{"cdci", "CDCIDescriptor1.SetVerticalSubsampling",
+                    "pCDCIDescriptor->SetVerticalSubsampling( aafInfo.verticalSubsampling )"},
+        RefusedCall{"cdci", "CDCIDescriptor1.SetColorSiting",
+                    "pCDCIDescriptor->SetColorSiting( (aafColorSiting_t)aafInfo.colorSiting )"},
+        RefusedCall{"cdci", "CDCIDescriptor1.SetColorRange",
+                    "pCDCIDescriptor->SetColorRange( aafInfo.colorRange )"},
+        RefusedCall{"cdci", "TypeDef1.CreateValue",
+                    "SetAVCISliceCount(pHeader, pDictionary, pCDCIDescriptor, "
+                    "aafInfo.sliceCounter)"},
+        RefusedCall{"", "CDCIDescriptor1.SetBlackReferenceLevel",
+                    "pCDCIDescriptor->SetBlackReferenceLevel( colorDetails.refBlack )"},
+        RefusedCall{"", "CDCIDescriptor1.SetWhiteReferenceLevel",
+                    "pCDCIDescriptor->SetWhiteReferenceLevel( colorDetails.refWhite )"},
+        RefusedCall{"", "CDCIDescriptor1.SetBlackReferenceLevel",
+                    "pCDCIDescriptor->SetBlackReferenceLevel( aafInfo.blackRefLevel )"},
+        RefusedCall{"", "CDCIDescriptor1.SetWhiteReferenceLevel",
+                    "pCDCIDescriptor->SetWhiteReferenceLevel( aafInfo.whiteRefLevel )"},
+        RefusedCall{"", "CDCIDescriptor1.SetCompression",
+                    "pDigitalImageDescriptor->SetCompression(aafInfo.pictureEssenceCoding)"},
+        RefusedCall{"", "Dictionary.CreateInstance ContainerDef",
+                    "pDictionary->CreateInstance(AUID_AAFContainerDef, IID_IAAFContainerDef, "
+                    "(IUnknown**)&pContainerDef)"},
+        RefusedCall{"", "ContainerDef1.Initialize",
+                    "pContainerDef->Initialize(containerFormatUID, (const aafCharacter*)L\"\", "
+                    "(const aafCharacter*)L\"\")"},
+        RefusedCall{"", "Dictionary.RegisterContainerDef",
+                    "pDictionary->RegisterContainerDef(pContainerDef)"},
+        RefusedCall{"", "CDCIDescriptor1.SetContainerFormat",
+                    "pFileDescriptor->SetContainerFormat(pContainerDef)"},
+        RefusedCall{"", "CDCIDescriptor1.SetFrameLayout",
+                    "pDigitalImageDescriptor->SetFrameLayout(aafInfo.frameLayout)"},
+        RefusedCall{"", "CDCIDescriptor1.SetStoredView",
+                    "pDigitalImageDescriptor->SetStoredView(aafInfo.storedHeight, "
+                    "aafInfo.storedWidth)"},
+        RefusedCall{"", "CDCIDescriptor1.SetSampledView",
+                    "pDigitalImageDescriptor->SetSampledView(aafInfo.storedHeight, "
+                    "aafInfo.sampledWidth, 0, 0)"},
+        RefusedCall{"", "CDCIDescriptor1.SetDisplayView",
+                    "pDigitalImageDescriptor->SetDisplayView(aafInfo.displayHeight, "
+                    "aafInfo.displayWidth, 0, aafInfo.displayYOffset)"},
+        RefusedCall{"", "CDCIDescriptor1.SetImageAspectRatio",
+                    "pDigitalImageDescriptor->SetImageAspectRatio( aspectRatio )"},
+        RefusedCall{"", "CDCIDescriptor1.SetSampleRate",
+                    "pFileDescriptor->SetSampleRate(editRate)"},
+        RefusedCall{"", "CDCIDescriptor1.SetLength", "pFileDescriptor->SetLength(movieLength)"},
+        RefusedCall{"", "CDCIDescriptor1.SetPropertyValue",
+                    "PutBoxesToAAF(pDictionary, pDigitalImageDescriptor, geometryDetails)"},
+        RefusedCall{"", "MultipleDescriptor1.GetSampleRate",
+                    "FixMultiDescSampleRate(pMultiDescriptor, editRate)"},
+        RefusedCall{"", "MultipleDescriptor1.AppendFileDescriptor",
+                    "pMultiDescriptor->AppendFileDescriptor( pFileDescriptor )"}));
+
+TEST_F(VideoDescriptorTest, ARefusedFileFormatCellEndsTheClip) {
+    aaf.refuse("MasterMob1.AppendComment 'Video File Format'");
+    EXPECT_EQ(Add(), NCF_E_FAIL);
+    EXPECT_EQ(log.count(ReturnRecord(
+                  NCF_E_FAIL, "AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0], &QTVff[0])",
+                  kFunction)),
+              1);
+}
+
+TEST_F(VideoDescriptorTest, TheMultipleDescriptorsRateIsSetOnceOnly) {
+    EXPECT_EQ(FixMultiDescSampleRate(nullptr, {25, 1}), NCF_E_INVALIDARG);
+    EXPECT_EQ(log.count("CHK_INARG(pMultiDesc)NMA::Impl::FixMultiDescSampleRate"), 1);
+    EXPECT_EQ(FixMultiDescSampleRate(multi, {48000, 1}), NCF_OK);
+    EXPECT_EQ(FixMultiDescSampleRate(multi, {25, 1}), NCF_OK);
+    EXPECT_EQ(aaf.linesOf("MultipleDescriptor1.SetSampleRate"),
+              std::vector<std::string>{"MultipleDescriptor1.SetSampleRate 48000/1"});
+}
+
+TEST_F(VideoDescriptorTest, TheMultipleDescriptorsRateLogsTheStatementThatFailed) {
+    const std::pair<const char*, const char*> statements[] = {
+        {"MultipleDescriptor1.QueryInterface",
+         "pMultiDesc->QueryInterface(IID_IAAFFileDescriptor, (void**)&pFileDescriptor)"},
+        {"MultipleDescriptor1.GetSampleRate", "pFileDescriptor->GetSampleRate(&currentSampleRate)"},
+        {"MultipleDescriptor1.SetSampleRate", "pFileDescriptor->SetSampleRate(sampleRate)"},
+    };
+    for (const auto& [call, statement] : statements) {
+        aaf.clearRefusals();
+        aaf.refuse(call, AAFRESULT_NOMEMORY);
+        EXPECT_EQ(FixMultiDescSampleRate(multi, {25, 1}), AAFRESULT_NOMEMORY);
+        EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, statement,
+                                         "NMA::Impl::FixMultiDescSampleRate")),
+                  1);
+    }
+}
+
+}  // namespace
+}  // namespace NMA::Impl
