@@ -1,0 +1,178 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "tests/unit/aaf_library/model/ModelFixture.h"
+
+namespace {
+
+class Objects : public ModelFixture {
+protected:
+    // An optional property of a number on every mob.
+    void SetUp() override {
+        ASSERT_EQ(Class(AUID_AAFMob)
+                      ->RegisterOptionalPropertyDef(kOwnId, L"Own", Type(kAAFTypeID_Int32).get(),
+                                                    nullptr),
+                  AAFRESULT_SUCCESS);
+        own = PropertyOf(AUID_AAFMob, kOwnId);
+        mob = New(AUID_AAFMasterMob);
+    }
+    Ptr<IAAFPropertyValue> Get() {
+        return Out<IAAFPropertyValue>(
+            [&](IAAFPropertyValue** out) { return mob->GetPropertyValue(own.get(), out); });
+    }
+
+    Ptr<IAAFPropertyDef> own;
+    Ptr<IAAFObject> mob;
+};
+
+TEST_F(Objects, ValueThatIsSetIsTheVeryOneGivenBack) {
+    const auto value = Int32Value(4);
+    ASSERT_EQ(mob->SetPropertyValue(own.get(), value.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(Get().get(), value.get());
+    EXPECT_EQ(CountOf(value), 2u);
+    aafInt32 number = 5;
+    ASSERT_EQ(TypeAs<IAAFTypeDefInt>(kAAFTypeID_Int32)
+                  ->SetInteger(value.get(), reinterpret_cast<aafMemPtr_t>(&number), 4),
+              AAFRESULT_SUCCESS);
+    EXPECT_EQ(NumberOf(Get()), 5);
+}
+
+TEST_F(Objects, ReplacedValueIsReleased) {
+    const auto first = Int32Value(1);
+    ASSERT_EQ(mob->SetPropertyValue(own.get(), first.get()), AAFRESULT_SUCCESS);
+    ASSERT_EQ(mob->SetPropertyValue(own.get(), first.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(CountOf(first), 2u);
+    ASSERT_EQ(mob->SetPropertyValue(own.get(), Int32Value(2).get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(CountOf(first), 1u);
+    EXPECT_EQ(NumberOf(Get()), 2);
+    EXPECT_EQ(NumberOf(first), 1);
+}
+
+TEST_F(Objects, OneValueOnTwoObjectsBecomesACopyOnTheSecond) {
+    const auto value = Int32Value(7);
+    const auto other = New(AUID_AAFMasterMob);
+    ASSERT_EQ(mob->SetPropertyValue(own.get(), value.get()), AAFRESULT_SUCCESS);
+    ASSERT_EQ(other->SetPropertyValue(own.get(), value.get()), AAFRESULT_SUCCESS);
+    const auto copy = Out<IAAFPropertyValue>(
+        [&](IAAFPropertyValue** out) { return other->GetPropertyValue(own.get(), out); });
+    EXPECT_NE(copy.get(), value.get());
+    EXPECT_EQ(NumberOf(copy), 7);
+}
+
+TEST_F(Objects, PropertyOfAnotherClassIsRefused) {
+    const auto filler = New(AUID_AAFFiller);
+    IAAFPropertyValue* out = nullptr;
+    aafBoolean_t present = kAAFFalse;
+    EXPECT_EQ(filler->SetPropertyValue(own.get(), Int32Value(1).get()), AAFRESULT_BAD_PROP);
+    EXPECT_EQ(filler->GetPropertyValue(own.get(), &out), AAFRESULT_BAD_PROP);
+    EXPECT_EQ(filler->IsPropertyPresent(own.get(), &present), AAFRESULT_BAD_PROP);
+    EXPECT_EQ(filler->RemoveOptionalProperty(own.get()), AAFRESULT_BAD_PROP);
+}
+
+TEST_F(Objects, AbsentPropertyIsReportedAsSuch) {
+    IAAFPropertyValue* out = nullptr;
+    aafBoolean_t present = kAAFTrue;
+    EXPECT_EQ(mob->GetPropertyValue(own.get(), &out), AAFRESULT_PROP_NOT_PRESENT);
+    EXPECT_EQ(mob->IsPropertyPresent(own.get(), &present), AAFRESULT_SUCCESS);
+    EXPECT_EQ(present, kAAFFalse);
+    EXPECT_EQ(mob->RemoveOptionalProperty(own.get()), AAFRESULT_PROP_NOT_PRESENT);
+}
+
+TEST_F(Objects, RemovalWorksAlsoForRequiredProperties) {
+    aaf::Object* object = aaf::ImplementationAs<aaf::Object>(mob.get());
+    object->PutStruct(aaf::prop::Mob_MobID, aafMobID_t{});
+    const auto required = PropertyOf(AUID_AAFMob, aaf::prop::Mob_MobID.id);
+    EXPECT_EQ(mob->RemoveOptionalProperty(required.get()), AAFRESULT_SUCCESS);
+    EXPECT_EQ(mob->RemoveOptionalProperty(required.get()), AAFRESULT_PROP_NOT_PRESENT);
+}
+
+TEST_F(Objects, TypeOfTheValueIsNotCompared) {
+    const auto name = PropertyOf(AUID_AAFMob, aaf::prop::Mob_Name.id);
+    EXPECT_EQ(mob->SetPropertyValue(name.get(), Int32Value(1).get()), AAFRESULT_SUCCESS);
+}
+
+TEST_F(Objects, ValueAndPropertyOfAnotherFileAreRefused) {
+    const aaf::RefPtr<aaf::Model> other = aaf::Model::Create(Registry());
+    const aaf::RefPtr<aaf::PropertyValue> value =
+        other->NewValue(*other->FindType(kAAFTypeID_Int32));
+    EXPECT_EQ(mob->SetPropertyValue(own.get(), value.get()), AAFRESULT_INVALID_OBJ);
+    const aaf::RefPtr<aaf::Object> stranger = other->NewObject<aaf::Object>(AUID_AAFMasterMob);
+    EXPECT_EQ(stranger->SetPropertyValue(own.get(), Int32Value(1).get()), AAFRESULT_BAD_PROP);
+}
+
+TEST_F(Objects, TypedSettersAndValuesAreTwoViewsOfOneProperty) {
+    aaf::Object* object = aaf::ImplementationAs<aaf::Object>(mob.get());
+    const auto name = PropertyOf(AUID_AAFMob, aaf::prop::Mob_Name.id);
+    ASSERT_EQ(object->PutString(aaf::prop::Mob_Name, L"abc"), AAFRESULT_SUCCESS);
+    aafBoolean_t present = kAAFFalse;
+    EXPECT_EQ(mob->IsPropertyPresent(name.get(), &present), AAFRESULT_SUCCESS);
+    EXPECT_EQ(present, kAAFTrue);
+    const auto value = Out<IAAFPropertyValue>(
+        [&](IAAFPropertyValue** out) { return mob->GetPropertyValue(name.get(), out); });
+    aafUInt32 count = 0;
+    EXPECT_EQ(TypeAs<IAAFTypeDefString>(kAAFTypeID_String)->GetCount(value.get(), &count),
+              AAFRESULT_SUCCESS);
+    EXPECT_EQ(count, 4u);
+    ASSERT_EQ(object->PutString(aaf::prop::Mob_Name, L"longer"), AAFRESULT_SUCCESS);
+    TypeAs<IAAFTypeDefString>(kAAFTypeID_String)->GetCount(value.get(), &count);
+    EXPECT_EQ(count, 7u);
+}
+
+TEST_F(Objects, PropertiesAreEnumeratedWithTheirValues) {
+    ASSERT_EQ(mob->SetPropertyValue(own.get(), Int32Value(9).get()), AAFRESULT_SUCCESS);
+    aafUInt32 count = 0;
+    ASSERT_EQ(mob->CountProperties(&count), AAFRESULT_SUCCESS);
+    EXPECT_EQ(count, 1u);
+    const auto list =
+        Out<IEnumAAFProperties>([&](IEnumAAFProperties** out) { return mob->GetProperties(out); });
+    const auto property = Out<IAAFProperty>([&](IAAFProperty** out) { return list->NextOne(out); });
+    EXPECT_EQ(Out<IAAFPropertyDef>([&](IAAFPropertyDef** out) {
+                  return property->GetDefinition(out);
+              }).get(),
+              own.get());
+    EXPECT_EQ(NumberOf(Out<IAAFPropertyValue>(
+                  [&](IAAFPropertyValue** out) { return property->GetValue(out); })),
+              9);
+    EXPECT_EQ(property->GetValue(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(property->GetDefinition(nullptr), AAFRESULT_NULL_PARAM);
+}
+
+TEST_F(Objects, OptionalValueIsMadeOnce) {
+    IAAFPropertyValue* out = nullptr;
+    ASSERT_EQ(mob->CreateOptionalPropertyValue(own.get(), &out), AAFRESULT_SUCCESS);
+    EXPECT_EQ(Get().get(), out);
+    EXPECT_EQ(NumberOf(Ptr<IAAFPropertyValue>::Adopt(out)), 0);
+    EXPECT_EQ(mob->CreateOptionalPropertyValue(own.get(), &out), AAFRESULT_PROP_ALREADY_PRESENT);
+}
+
+TEST_F(Objects, GenerationIsNotTrackedByDefault) {
+    IAAFIdentification* generation = nullptr;
+    aafBoolean_t tracked = kAAFTrue;
+    EXPECT_EQ(mob->GetGeneration(&generation), AAFRESULT_INVALID_PARAM);
+    EXPECT_EQ(mob->IsGenerationTracked(&tracked), AAFRESULT_SUCCESS);
+    EXPECT_EQ(tracked, kAAFFalse);
+    EXPECT_EQ(mob->EnableGenerationTracking(), AAFRESULT_SUCCESS);
+    EXPECT_EQ(mob->IsGenerationTracked(&tracked), AAFRESULT_SUCCESS);
+    EXPECT_EQ(tracked, kAAFTrue);
+}
+
+TEST_F(Objects, NullArgumentsAreRefused) {
+    IAAFPropertyValue* value = nullptr;
+    aafBoolean_t flag = kAAFFalse;
+    EXPECT_EQ(mob->SetPropertyValue(nullptr, Int32Value(1).get()), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->SetPropertyValue(own.get(), nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->GetPropertyValue(nullptr, &value), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->GetPropertyValue(own.get(), nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->IsPropertyPresent(nullptr, &flag), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->IsPropertyPresent(own.get(), nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->RemoveOptionalProperty(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->CreateOptionalPropertyValue(own.get(), nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->GetDefinition(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->GetDictionary(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->GetProperties(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->CountProperties(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->GetGeneration(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->GetGenerationAUID(nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(mob->IsGenerationTracked(nullptr), AAFRESULT_NULL_PARAM);
+}
+
+}  // namespace
