@@ -1,7 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 // The functions that a program finds in this library by name.
-#include <cstring>
 #include <new>
 
 #include "host_interfaces/aaf/AAFExports.h"
@@ -40,11 +39,12 @@ HRESULT Guarded(Operation operation) {
 
 // The kind that a file carries, if it is one that this library can read.
 bool FindKind(aafCharacter_constptr fileName, aafUID_t& kind) {
-    aaf::stored::StoredAuid stored{};
-    if (!aaf::stored::isAafFile(aaf::PathOf(fileName), &stored)) {
+    aaf::stored::SectorSize sectors{};
+    if (!aaf::stored::isAafFile(aaf::PathOf(fileName), &sectors)) {
         return false;
     }
-    std::memcpy(&kind, stored.data(), sizeof kind);
+    kind = sectors == aaf::stored::SectorSize::Bytes4096 ? kAAFFileKind_Aaf4KBinary
+                                                         : kAAFFileKind_Aaf512Binary;
     return true;
 }
 

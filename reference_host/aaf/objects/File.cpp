@@ -2,8 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/aaf/objects/File.h"
 
-#include <cstring>
-
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFExports.h"
@@ -145,12 +143,8 @@ HRESULT File::Load(aafCharacter_constptr path, aafUInt32 modeFlags) {
     if (!header || header->content() == nullptr) {
         return AAFRESULT_BADHEAD;
     }
-    aafUID_t kind{};
-    stored::StoredAuid storedKind{};
-    if (stored::isAafFile(path_, &storedKind)) {
-        std::memcpy(&kind, storedKind.data(), sizeof kind);
-        largeSectors_ = kind == kAAFFileKind_Aaf4KBinary;
-    }
+    stored::SectorSize sectors{};
+    largeSectors_ = stored::isAafFile(path_, &sectors) && sectors == stored::SectorSize::Bytes4096;
     header_ = header;
     return AAFRESULT_SUCCESS;
 }

@@ -1,0 +1,165 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "tests/unit/aaf_library/objects/ClipDescription.h"
+
+namespace aaf_test {
+
+TEST_F(ClipDescription, OfAWholeClipSucceedsInEveryCall) {
+    DescribeClip();
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(3u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFPhysicalMob, &count));
+    EXPECT_EQ(1u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, file_->Save());
+}
+
+TEST_F(ClipDescription, LetsTheFileOutliveItsMaker) {
+    DescribeClip();
+    file_->AddRef();
+    IAAFFile* handedOver = file_;
+    master_.Reset();
+    file_mob_.Reset();
+    source_.Reset();
+    multiple_.Reset();
+    header_.Reset();
+    dictionary_.Reset();
+    file_.Reset();
+    Ptr<IAAFFile> file(handedOver);
+    Ptr<IAAFHeader> header;
+    Ptr<IAAFMob> mob;
+    EXPECT_EQ(1u, ReferencesOf(file.get()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0x01), mob.Out()));
+}
+
+TEST_F(ClipDescription, GivesEssenceSlotsOneIdInAllMobs) {
+    MakeMobs();
+    AddTrack(kAAFDataDef_LegacyPicture, 2);
+    AddTrack(kAAFDataDef_LegacySound, 3);
+    const struct {
+        IAAFMob* mob;
+        aafLength_t length;
+        aafMobID_t source;
+    } expected[] = {{master_, 300, MobId(0xB1)},
+                    {file_mob_, 300, MobId(0xA1)},
+                    {source_, 12960000, aafMobID_t{}}};
+    for (const auto& entry : expected) {
+        aafUInt32 count = 0;
+        EXPECT_EQ(AAFRESULT_SUCCESS, entry.mob->CountSlots(&count));
+        EXPECT_EQ(2u, count);
+        for (aafSlotID_t id : {2u, 3u}) {
+            Ptr<IAAFMobSlot> slot;
+            Ptr<IAAFSegment> segment;
+            aafLength_t length = 0;
+            aafSourceRef_t reference{};
+            ASSERT_EQ(AAFRESULT_SUCCESS, entry.mob->LookupSlot(id, slot.Out()));
+            EXPECT_EQ(
+                L"", TextOf<IAAFMobSlot>(slot, &IAAFMobSlot::GetNameBufLen, &IAAFMobSlot::GetName));
+            ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+            EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
+            EXPECT_EQ(entry.length, length);
+            EXPECT_EQ(AAFRESULT_SUCCESS,
+                      As<IAAFSourceClip>(segment)->GetSourceReference(&reference));
+            EXPECT_TRUE(SameMobId(entry.source, reference.sourceID));
+        }
+    }
+    MoveFileMobClips(77);
+    Ptr<IAAFMobSlot> slot;
+    Ptr<IAAFSegment> segment;
+    aafSourceRef_t reference{};
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_mob_->LookupSlot(3, slot.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&reference));
+    EXPECT_EQ(77, reference.startTime);
+}
+
+TEST_F(ClipDescription, PutsLaterTimecodeBetweenFillers) {
+    MakeMobs();
+    AddTimecode({0, 0, 30}, 2592000, 2592000, 1, 0);
+    AddTimecode({1234, 1, 30}, 300, 2592000, 2, 1);
+    Ptr<IAAFMobSlot> slot;
+    Ptr<IAAFSegment> segment;
+    aafUInt32 number = 0;
+    aafUInt32 count = 0;
+    aafLength_t length = 0;
+    ASSERT_EQ(AAFRESULT_SUCCESS, source_->LookupSlot(2, slot.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetPhysicalNum(&number));
+    EXPECT_EQ(3u, number);
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFSequence>(segment)->CountComponents(&count));
+    EXPECT_EQ(3u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
+    EXPECT_EQ(2592000, length);
+}
+
+TEST_F(ClipDescription, HoldsPictureAndSoundInOneDescriptor) {
+    MakeMobs();
+    AddPicture();
+    AddPicture();  // a second one, as for alpha, on the same dictionary
+    AddSound();
+    aafUInt32 count = 0;
+    aafRational_t rate{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, multiple_->CountFileDescriptors(&count));
+    EXPECT_EQ(3u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFFileDescriptor>(multiple_)->GetSampleRate(&rate));
+    EXPECT_EQ(30000, rate.numerator);
+    Ptr<IAAFFileDescriptor> last;
+    ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->GetFileDescriptorAt(2, last.Out()));
+    aafUInt32 bps = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFPCMDescriptor>(last)->GetAverageBPS(&bps));
+    EXPECT_EQ(1536000u, bps);
+}
+
+TEST_F(ClipDescription, KeepsTheBoxesOfAPicture) {
+    MakeMobs();
+    AddPicture();
+    Ptr<IAAFFileDescriptor> picture;
+    ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->GetFileDescriptorAt(0, picture.Out()));
+    Ptr<IAAFClassDef> pictures;
+    Ptr<IAAFPropertyDef> property;
+    Ptr<IAAFPropertyValue> value;
+    Ptr<IAAFTypeDef> type;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              dictionary_->LookupClassDef(AUID_AAFCDCIDescriptor, pictures.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              pictures->LookupPropertyDef(ncfGuid("0E040101-0101-0106-060E-2B3401010101"),
+                                          property.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(picture)->GetPropertyValue(property, value.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, value->GetType(type.Out()));
+    aafRational_t box[4] = {};
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTypeDefRecord>(type)->GetStruct(
+                                     value, reinterpret_cast<aafMemPtr_t>(box), sizeof box));
+    EXPECT_EQ(2, box[0].numerator);
+    EXPECT_EQ(-2, box[1].numerator);
+    EXPECT_EQ(1920, box[2].numerator);
+}
+
+TEST_F(ClipDescription, KeepsColumnsAppCodeAndAttributeList) {
+    MakeMobs();
+    SetAppCode();
+    AddColumns();
+    SetAttributeList();
+    EXPECT_EQ((Texts{{L"Video", L"ProRes 422"},
+                     {L"Video File Format", L"MOV"},
+                     {L"Audio Format", L"LPCM"},
+                     {L"Audio Format", L"LPCM"},
+                     {L"Field Ordering", L"Default"},
+                     {L"GFX-Video Level", L"Do not modify levels"}}),
+              Comments(master_));
+    Ptr<IAAFClassDef> mobs;
+    Ptr<IAAFPropertyDef> property;
+    Ptr<IAAFPropertyValue> list;
+    Ptr<IAAFTypeDef> type;
+    aafUInt32 count = 0;
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupClassDef(AUID_AAFMob, mobs.Out()));
+    ASSERT_EQ(
+        AAFRESULT_SUCCESS,
+        mobs->LookupPropertyDef(ncfGuid("60958183-47B1-11D4-A01C-0004AC969F50"), property.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(master_)->GetPropertyValue(property, list.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, list->GetType(type.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTypeDefVariableArray>(type)->GetCount(list, &count));
+    EXPECT_EQ(1u, count);
+}
+
+}  // namespace aaf_test

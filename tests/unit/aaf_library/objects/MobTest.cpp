@@ -1,0 +1,370 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <cstring>
+
+#include "tests/unit/aaf_library/objects/TransientFile.h"
+
+namespace aaf_test {
+
+using Mob = TransientFile;
+
+TEST_F(Mob, StartsWithAFreshIdOfTheUsualLabel) {
+    aafMobID_t first{};
+    aafMobID_t second{};
+    Make<IAAFMob>(AUID_AAFMasterMob)->GetMobID(&first);
+    Make<IAAFMob>(AUID_AAFMasterMob)->GetMobID(&second);
+    const aafUInt8 label[] = {0x06, 0x0A, 0x2B, 0x34, 0x01, 0x01,
+                              0x01, 0x01, 0x01, 0x01, 0x0F, 0x00};
+    EXPECT_EQ(0, std::memcmp(label, first.SMPTELabel, sizeof label));
+    EXPECT_EQ(0x13, first.length);
+    EXPECT_EQ(0, first.instanceHigh);
+    EXPECT_EQ(0, first.instanceMid);
+    EXPECT_EQ(0, first.instanceLow);
+    EXPECT_FALSE(SameMobId(first, second));
+}
+
+TEST_F(Mob, StartsWithTheTimeOfDayAndWithoutNameOrSlots) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    aafTimeStamp_t created{};
+    aafTimeStamp_t modified{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetCreateTime(&created));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetModTime(&modified));
+    EXPECT_GE(created.date.year, 2026);
+    EXPECT_EQ(0, created.time.fraction);
+    EXPECT_EQ(0, std::memcmp(&created, &modified, sizeof created));
+    aafUInt32 length = 0;
+    wchar_t name[8] = L"";
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetName(name, sizeof name));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetNameBufLen(&length));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&length));
+    EXPECT_EQ(0u, length);
+}
+
+TEST_F(Mob, HasOneReferenceAndOneIdentity) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    EXPECT_EQ(1u, ReferencesOf(mob.get()));
+    Ptr<IUnknown> ofMob = As<IUnknown>(mob);
+    Ptr<IUnknown> ofMaster = As<IUnknown>(As<IAAFMasterMob>(mob));
+    EXPECT_EQ(ofMob.get(), ofMaster.get());
+    EXPECT_NE(static_cast<void*>(ofMob.get()), static_cast<void*>(mob.get()));
+}
+
+TEST_F(Mob, TakesAnyIdWhileItIsFree) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    aafMobID_t id{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetMobID(aafMobID_t{}));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetMobID(MobId(7)));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetMobID(&id));
+    EXPECT_TRUE(SameMobId(MobId(7), id));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->GetMobID(nullptr));
+}
+
+TEST_F(Mob, TakesAnyNameButNone) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->SetName(nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L""));
+    aafUInt32 bytes = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetNameBufLen(&bytes));
+    EXPECT_EQ(sizeof(aafCharacter), bytes);
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L"\x00E4 \x20AC"));
+    EXPECT_EQ(L"\x00E4 \x20AC", TextOf<IAAFMob>(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
+    wchar_t small[2];
+    EXPECT_EQ(AAFRESULT_SMALLBUF, mob->GetName(small, sizeof small));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->GetName(nullptr, 100));
+}
+
+TEST_F(Mob, GivesNameAndTimesTogether) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    const aafTimeStamp_t time{{2020, 2, 29}, {1, 2, 3, 4}};
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->SetModTime(time));
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->SetCreateTime(time));
+    aafTimeStamp_t modified{};
+    aafTimeStamp_t created{};
+    wchar_t name[8] = L"";
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetMobInfo(&modified, &created, name, sizeof name));
+    mob->SetName(L"clip");
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetMobInfo(&modified, &created, name, sizeof name));
+    EXPECT_STREQ(L"clip", name);
+    EXPECT_EQ(0, std::memcmp(&time, &modified, sizeof time));
+    EXPECT_EQ(0, std::memcmp(&time, &created, sizeof time));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->GetMobInfo(nullptr, &created, name, sizeof name));
+}
+
+TEST_F(Mob, InitializesAnyNumberOfTimes) {
+    Ptr<IAAFMasterMob> master = Make<IAAFMasterMob>(AUID_AAFMasterMob);
+    Ptr<IAAFSourceMob> source = Make<IAAFSourceMob>(AUID_AAFSourceMob);
+    EXPECT_EQ(AAFRESULT_SUCCESS, master->Initialize());
+    EXPECT_EQ(AAFRESULT_SUCCESS, master->Initialize());
+    EXPECT_EQ(AAFRESULT_SUCCESS, source->Initialize());
+    EXPECT_EQ(AAFRESULT_SUCCESS, source->Initialize());
+}
+
+TEST_F(Mob, IsOfOneKindOnly) {
+    Ptr<IAAFMob> master = Make<IAAFMob>(AUID_AAFMasterMob);
+    void* out = master.get();
+#ifdef _WIN32
+    const HRESULT refused = static_cast<HRESULT>(0x80004002u);
+#else
+    const HRESULT refused = static_cast<HRESULT>(0x80000004u);
+#endif
+    EXPECT_EQ(refused, master->QueryInterface(IID_IAAFSourceMob, &out));
+    EXPECT_EQ(nullptr, out);
+}
+
+TEST_F(Mob, AppendsTimelineSlots) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IAAFSegment> segment = As<IAAFSegment>(Clip(5));
+    Ptr<IAAFTimelineMobSlot> slot;
+    EXPECT_EQ(AAFRESULT_NULL_PARAM,
+              mob->AppendNewTimelineSlot({25, 1}, nullptr, 1, L"a", 0, slot.Out()));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM,
+              mob->AppendNewTimelineSlot({25, 1}, segment, 1, nullptr, 0, slot.Out()));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM,
+              mob->AppendNewTimelineSlot({25, 1}, segment, 1, L"a", 0, nullptr));
+    // Neither rate nor origin nor id is checked.
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              mob->AppendNewTimelineSlot({1, 0}, segment, 0, L"name", -3, slot.Out()));
+    EXPECT_EQ(2u, ReferencesOf(slot.get()));
+    aafPosition_t origin = 0;
+    aafRational_t rate{};
+    aafSlotID_t id = 9;
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetOrigin(&origin));
+    EXPECT_EQ(-3, origin);
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetEditRate(&rate));
+    EXPECT_EQ(1, rate.numerator);
+    EXPECT_EQ(0, rate.denominator);
+    Ptr<IAAFMobSlot> plain = As<IAAFMobSlot>(slot);
+    EXPECT_EQ(AAFRESULT_SUCCESS, plain->GetSlotID(&id));
+    EXPECT_EQ(0u, id);
+    EXPECT_EQ(L"name",
+              TextOf<IAAFMobSlot>(plain, &IAAFMobSlot::GetNameBufLen, &IAAFMobSlot::GetName));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED,
+              mob->AppendNewTimelineSlot({25, 1}, segment, 2, L"b", 0, slot.Out()));
+    aafUInt32 count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&count));
+    EXPECT_EQ(1u, count);
+}
+
+TEST_F(Mob, AppendsStaticAndEventSlots) {
+    Ptr<IAAFMob2> mob = Make<IAAFMob2>(AUID_AAFMasterMob);
+    Ptr<IAAFStaticMobSlot> fixed;
+    Ptr<IAAFEventMobSlot> events;
+    EXPECT_EQ(AAFRESULT_SUCCESS,
+              mob->AppendNewStaticSlot(As<IAAFSegment>(Clip(5)), 1, L"still", fixed.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendNewEventSlot({25, 1}, As<IAAFSegment>(Clip(5)), 2,
+                                                         L"events", 7, events.Out()));
+    aafPosition_t origin = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFEventMobSlot2>(events)->GetEventSlotOrigin(&origin));
+    EXPECT_EQ(7, origin);
+    aafRational_t rate{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, events->GetEditRate(&rate));
+    EXPECT_EQ(25, rate.numerator);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, events->SetEditRate(nullptr));
+}
+
+TEST_F(Mob, FindsTheFirstSlotWithAnId) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IAAFTimelineMobSlot> first;
+    Ptr<IAAFTimelineMobSlot> second;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(Clip(1)), 4,
+                                                            L"", 0, first.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(Clip(1)), 4,
+                                                            L"", 0, second.Out()));
+    Ptr<IAAFMobSlot> found;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(4, found.Out()));
+    EXPECT_EQ(As<IAAFMobSlot>(first).get(), found.get());
+    IAAFMobSlot* out = found;
+    EXPECT_EQ(AAFRESULT_SLOT_NOT_FOUND, mob->LookupSlot(5, &out));
+    EXPECT_EQ(nullptr, out);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->LookupSlot(4, nullptr));
+}
+
+TEST_F(Mob, KeepsSlotsInOrderAndFreesRemovedOnes) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IAAFMobSlot> slots[3];
+    for (aafSlotID_t id = 0; id < 3; ++id) {
+        slots[id] = Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot);
+        slots[id]->SetSlotID(id);
+    }
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->AppendSlot(nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendSlot(slots[2]));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->PrependSlot(slots[0]));
+    EXPECT_EQ(AAFRESULT_BADINDEX, mob->InsertSlotAt(3, slots[1]));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->InsertSlotAt(1, slots[1]));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, mob->AppendSlot(slots[1]));
+    for (aafUInt32 at = 0; at < 3; ++at) {
+        Ptr<IAAFMobSlot> slot;
+        EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetSlotAt(at, slot.Out()));
+        EXPECT_EQ(slots[at].get(), slot.get());
+    }
+    Ptr<IAAFMobSlot> none;
+    EXPECT_EQ(AAFRESULT_BADINDEX, mob->GetSlotAt(3, none.Out()));
+    EXPECT_EQ(AAFRESULT_BADINDEX, mob->RemoveSlotAt(3));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->RemoveSlotAt(1));
+    EXPECT_EQ(AAFRESULT_SUCCESS, Make<IAAFMob>(AUID_AAFMasterMob)->AppendSlot(slots[1]));
+}
+
+TEST_F(Mob, EnumeratesItsLiveListOfSlots) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IEnumAAFMobSlots> slots;
+    Ptr<IAAFMobSlot> slot;
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->GetSlots(nullptr));
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetSlots(slots.Out()));
+    EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, slots->NextOne(slot.Out()));
+    mob->AppendSlot(Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slots->NextOne(slot.Out()));
+    IAAFMobSlot* untouched = slot;
+    EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, slots->NextOne(&untouched));
+    EXPECT_EQ(slot.get(), untouched);
+}
+
+TEST_F(Mob, KeepsEveryCommentInOrderAlsoUnderOneName) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IEnumAAFTaggedValues> none;
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetComments(none.Out()));
+    wchar_t audio[] = L"Audio Format";
+    wchar_t empty[] = L"";
+    std::wstring longName(100, L'n');
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->AppendComment(nullptr, L"x"));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->AppendComment(audio, nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(audio, L"LPCM"));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(longName.data(), L"long"));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(audio, L"AAC"));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(empty, L""));
+    EXPECT_EQ((Texts{{L"Audio Format", L"LPCM"},
+                     {longName, L"long"},
+                     {L"Audio Format", L"AAC"},
+                     {L"", L""}}),
+              Comments(mob));
+    aafUInt32 count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountComments(&count));
+    EXPECT_EQ(4u, count);
+}
+
+TEST_F(Mob, StoresACommentAsATextWithItsEnd) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    wchar_t name[] = L"name";
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(name, L"abc"));
+    Ptr<IEnumAAFTaggedValues> all;
+    Ptr<IAAFTaggedValue> value;
+    Ptr<IAAFTypeDef> type;
+    Ptr<IAAFTypeDef> text;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetComments(all.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
+    aafUInt32 bytes = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, value->GetValueBufLen(&bytes));
+    EXPECT_EQ(4 * sizeof(aafCharacter), bytes);
+    EXPECT_EQ(AAFRESULT_SUCCESS, value->GetTypeDefinition(type.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(kAAFTypeID_String, text.Out()));
+    EXPECT_EQ(text.get(), type.get());
+}
+
+TEST_F(Mob, RemovesComments) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IAAFTaggedValue> foreign = Make<IAAFTaggedValue>(AUID_AAFTaggedValue);
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->RemoveComment(foreign));
+    wchar_t name[] = L"name";
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(name, L"abc"));
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_ATTACHED, mob->RemoveComment(foreign));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->RemoveComment(nullptr));
+    Ptr<IEnumAAFTaggedValues> all;
+    Ptr<IAAFTaggedValue> value;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetComments(all.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->RemoveComment(value));
+    aafUInt32 count = 9;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountComments(&count));
+    EXPECT_EQ(0u, count);
+}
+
+TEST_F(Mob, KeepsAttributesAndRawData) {
+    Ptr<IAAFMob2> mob = Make<IAAFMob2>(AUID_AAFMasterMob);
+    Ptr<IEnumAAFTaggedValues> attributes;
+    Ptr<IEnumAAFKLVData> raw;
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetAttributes(attributes.Out()));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetKLVData(raw.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendAttribute(L"a", L"1"));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendAttribute(L"a", L"1"));
+    aafUInt32 count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountAttributes(&count));
+    EXPECT_EQ(2u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetAttributes(attributes.Out()));
+
+    Ptr<IAAFKLVData> data = Make<IAAFKLVData>(AUID_AAFKLVData);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->AppendKLVData(nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendKLVData(data));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, mob->AppendKLVData(data));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountKLVData(&count));
+    EXPECT_EQ(1u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->RemoveKLVData(data));
+}
+
+TEST_F(Mob, ChangesReferencesInAllThatItHolds) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IAAFSequence> sequence = Make<IAAFSequence>(AUID_AAFSequence);
+    Ptr<IAAFSourceClip> clip = Make<IAAFSourceClip>(AUID_AAFSourceClip);
+    ASSERT_EQ(AAFRESULT_SUCCESS, clip->Initialize(DataDef(kAAFDataDef_LegacyPicture), 5,
+                                                  aafSourceRef_t{MobId(1), 2, 3}));
+    sequence->Initialize(DataDef(kAAFDataDef_LegacyPicture));
+    ASSERT_EQ(AAFRESULT_SUCCESS, sequence->AppendComponent(As<IAAFComponent>(clip)));
+    Ptr<IAAFTimelineMobSlot> slot;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(sequence), 1,
+                                                            L"", 0, slot.Out()));
+    aafSourceRef_t reference{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->ChangeRef(MobId(8), MobId(9)));
+    EXPECT_EQ(AAFRESULT_SUCCESS, clip->GetSourceReference(&reference));
+    EXPECT_TRUE(SameMobId(MobId(1), reference.sourceID));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->ChangeRef(MobId(1), MobId(9)));
+    EXPECT_EQ(AAFRESULT_SUCCESS, clip->GetSourceReference(&reference));
+    EXPECT_TRUE(SameMobId(MobId(9), reference.sourceID));
+    EXPECT_EQ(3, reference.startTime);
+}
+
+TEST_F(Mob, CopiesItselfIntoItsFileUnderAFreshId) {
+    Ptr<IAAFMob> mob = FileMob(1);
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
+    Ptr<IAAFMob> copy;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->Copy(L"twin", copy.Out()));
+    aafMobID_t id{};
+    aafUInt32 slots = 0;
+    aafNumSlots_t mobs = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, copy->GetMobID(&id));
+    EXPECT_FALSE(SameMobId(MobId(1), id));
+    EXPECT_EQ(L"twin", TextOf<IAAFMob>(copy, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
+    EXPECT_EQ(AAFRESULT_SUCCESS, copy->CountSlots(&slots));
+    EXPECT_EQ(1u, slots);
+    EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFFileMob, &mobs));
+    EXPECT_EQ(2u, mobs);
+}
+
+TEST_F(Mob, OfACompositionHasDefaultFades) {
+    Ptr<IAAFCompositionMob2> mob = Make<IAAFCompositionMob2>(AUID_AAFCompositionMob);
+    aafDefaultFade_t fade{};
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->Initialize(nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->Initialize(L"edit"));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetDefaultFade(&fade));
+    EXPECT_EQ(kAAFFalse, fade.valid);
+    EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, mob->SetDefaultFade(4, 3, {25, 1}));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetDefaultFade(4, kAAFFadeLinearAmp, {25, 1}));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetDefaultFade(&fade));
+    EXPECT_EQ(kAAFTrue, fade.valid);
+    EXPECT_EQ(4, fade.fadeLength);
+    EXPECT_EQ(25, fade.fadeEditUnit.numerator);
+    aafMobID_t rendering{};
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetRendering(&rendering));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetRendering(MobId(4)));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetRendering(&rendering));
+    EXPECT_TRUE(SameMobId(MobId(4), rendering));
+}
+
+TEST_F(Mob, AnswersNotImplementedToAccessOfEssence) {
+    Ptr<IAAFMasterMob> master = Make<IAAFMasterMob>(AUID_AAFMasterMob);
+    Ptr<IAAFSearchSource> search = As<IAAFSearchSource>(master);
+    Ptr<IAAFFindSourceInfo> info;
+    aafUInt16 channels = 0;
+    EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED, master->CountChannels(1, nullptr, nullptr, &channels));
+    EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED,
+              search->SearchSource(1, 0, kAAFFileMob, nullptr, nullptr, info.Out()));
+}
+
+}  // namespace aaf_test

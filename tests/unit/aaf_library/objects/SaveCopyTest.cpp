@@ -1,0 +1,310 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <cstring>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+
+#include "tests/unit/aaf_library/objects/ClipDescription.h"
+
+namespace aaf_test {
+
+class SaveCopy : public ClipDescription {
+protected:
+    SaveCopy() {
+        std::string name =
+            "aaf_library_" +
+            std::string(::testing::UnitTest::GetInstance()->current_test_info()->name());
+        folder_ = std::filesystem::temp_directory_path() / name;
+        std::filesystem::remove_all(folder_);
+        std::filesystem::create_directories(folder_);
+    }
+    ~SaveCopy() override {
+        AAFCliphostPinTime(nullptr, nullptr);
+        std::filesystem::remove_all(folder_);
+    }
+
+    std::wstring Path(const char* name) const { return (folder_ / name).wstring(); }
+    Ptr<IAAFFile> NewFile(const std::wstring& path,
+                          const aafUID_t& kind = kAAFFileKind_Aaf512Binary, aafUInt32 flags = 0) {
+        Ptr<IAAFFile> made;
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  AAFFileOpenNewModifyEx(path.c_str(), &kind, flags, &product_.ident, made.Out()));
+        return made;
+    }
+    void Copy(const std::wstring& path, const aafUID_t& kind = kAAFFileKind_Aaf512Binary) {
+        Ptr<IAAFFile> target = NewFile(path, kind);
+        ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target));
+        ASSERT_EQ(AAFRESULT_SUCCESS, target->Close());
+    }
+    static std::string Content(const std::wstring& path) {
+        std::ifstream stream(std::filesystem::path(path), std::ios::binary);
+        return {std::istreambuf_iterator<char>(stream), std::istreambuf_iterator<char>()};
+    }
+
+    std::filesystem::path folder_;
+};
+
+TEST_F(SaveCopy, WritesAFileThatReadsBackWhole) {
+    DescribeClip();
+    const std::wstring path = Path("clip.aaf");
+    Copy(path);
+    Ptr<IAAFFile> read;
+    Ptr<IAAFHeader> header;
+    Ptr<IAAFDictionary> dictionary;
+    Ptr<IAAFMob> master;
+    Ptr<IAAFMob> fileMob;
+    Ptr<IAAFMob> source;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, read.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, read->GetHeader(header.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, read->GetDictionary(dictionary.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0x01), master.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0xB1), fileMob.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0xA1), source.Out()));
+    EXPECT_EQ(L"A001", TextOf<IAAFMob>(master, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
+    EXPECT_EQ(Comments(master_), Comments(master));
+
+    aafUInt32 count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, source->CountSlots(&count));
+    EXPECT_EQ(5u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, fileMob->CountSlots(&count));
+    EXPECT_EQ(3u, count);
+
+    Ptr<IAAFMobSlot> slot;
+    Ptr<IAAFSegment> segment;
+    Ptr<IAAFMob> resolved;
+    aafSourceRef_t reference{};
+    ASSERT_EQ(AAFRESULT_SUCCESS, fileMob->LookupSlot(3, slot.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSourceClip> clip = As<IAAFSourceClip>(segment);
+    EXPECT_EQ(AAFRESULT_SUCCESS, clip->GetSourceReference(&reference));
+    EXPECT_EQ(1000, reference.startTime);
+    EXPECT_EQ(AAFRESULT_SUCCESS, clip->ResolveRef(resolved.Out()));
+    EXPECT_EQ(source.get(), resolved.get());
+
+    Ptr<IAAFEssenceDescriptor> essence;
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceMob>(fileMob)->GetEssenceDescriptor(essence.Out()));
+    Ptr<IAAFMultipleDescriptor> multiple = As<IAAFMultipleDescriptor>(essence);
+    Ptr<IAAFFileDescriptor> part;
+    Ptr<IAAFContainerDef> container;
+    Ptr<IAAFLocator> locator;
+    ASSERT_EQ(AAFRESULT_SUCCESS, multiple->GetFileDescriptorAt(0, part.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, part->GetContainerFormat(container.Out()));
+    aafInt32 width = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFCDCIDescriptor>(part)->GetComponentWidth(&width));
+    EXPECT_EQ(10, width);
+    ASSERT_EQ(AAFRESULT_SUCCESS, essence->GetLocatorAt(0, locator.Out()));
+    EXPECT_EQ(L"file:///media/A001.mov",
+              TextOf<IAAFLocator>(locator, &IAAFLocator::GetPathBufLen, &IAAFLocator::GetPath));
+
+    // The extensions came along.
+    Ptr<IAAFClassDef> pictures;
+    Ptr<IAAFPropertyDef> property;
+    Ptr<IAAFPropertyValue> value;
+    Ptr<IAAFTypeDef> type;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              dictionary->LookupClassDef(AUID_AAFCDCIDescriptor, pictures.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              pictures->LookupPropertyDef(ncfGuid("0E040101-0101-010E-060E-2B3401010101"),
+                                          property.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(part)->GetPropertyValue(property, value.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, value->GetType(type.Out()));
+    aafInt32 slices = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTypeDefInt>(type)->GetInteger(
+                                     value, reinterpret_cast<aafMemPtr_t>(&slices), 4));
+    EXPECT_EQ(10, slices);
+    EXPECT_EQ(AAFRESULT_SUCCESS, dictionary->LookupTypeDef(
+                                     ncfGuid("0E040301-0200-0000-060E-2B3401040101"), type.Out()));
+    EXPECT_EQ(AAFRESULT_WRONG_OPENMODE, read->Save());
+    EXPECT_EQ(AAFRESULT_SUCCESS, read->Close());
+}
+
+TEST_F(SaveCopy, CarriesExtensionsThatNothingUses) {
+    Ptr<IAAFClassDef> mobs;
+    Ptr<IAAFTypeDef> type;
+    Ptr<IAAFPropertyDef> property;
+    const aafUID_t id = ncfGuid("ABCDEF00-0000-0000-0000-000000000004");
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupClassDef(AUID_AAFMob, mobs.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(kAAFTypeID_Int32, type.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              mobs->RegisterOptionalPropertyDef(id, L"Idle", type, property.Out()));
+    Ptr<IAAFFile> target = NewFile(Path("idle.aaf"));
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target));
+    Ptr<IAAFDictionary> dictionary;
+    ASSERT_EQ(AAFRESULT_SUCCESS, target->GetDictionary(dictionary.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->LookupClassDef(AUID_AAFMob, mobs.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mobs->LookupPropertyDef(id, property.Out()));
+    aafBoolean_t optional = kAAFFalse;
+    EXPECT_EQ(AAFRESULT_SUCCESS, property->GetIsOptional(&optional));
+    EXPECT_EQ(kAAFTrue, optional);
+}
+
+TEST_F(SaveCopy, GivesEqualFilesOfEqualClipsWhileTimeIsPinned) {
+    const aafTimeStamp_t time{{2026, 1, 2}, {3, 4, 5, 0}};
+    const aafUID_t generation = ncfGuid("ABCDEF00-0000-0000-0000-000000000005");
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFCliphostPinTime(&time, &generation));
+    DescribeClip();
+    Copy(Path("a.aaf"));
+    Copy(Path("b.aaf"));
+    const std::string first = Content(Path("a.aaf"));
+    EXPECT_FALSE(first.empty());
+    EXPECT_TRUE(first == Content(Path("b.aaf")));
+}
+
+TEST_F(SaveCopy, NeedsATargetWithoutMobs) {
+    Ptr<IAAFFile> target = NewFile(Path("full.aaf"));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(FileMob(1)));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, file_->SaveCopyAs(nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target));
+    EXPECT_EQ(AAFRESULT_OPERATION_NOT_PERMITTED, file_->SaveCopyAs(target));
+    EXPECT_EQ(AAFRESULT_OPERATION_NOT_PERMITTED, file_->SaveCopyAs(file_));
+    EXPECT_EQ(AAFRESULT_SUCCESS, target->Close());
+    EXPECT_EQ(AAFRESULT_NOT_OPEN, file_->SaveCopyAs(target));
+    Ptr<IAAFFile> read;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(Path("full.aaf").c_str(), 0, read.Out()));
+    EXPECT_EQ(AAFRESULT_WRONG_OPENMODE, file_->SaveCopyAs(read));
+}
+
+TEST_F(SaveCopy, LeavesTheOriginalAsItWas) {
+    DescribeClip();
+    Copy(Path("copy.aaf"));
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(3u, count);
+    EXPECT_EQ(AAFRESULT_SUCCESS, master_->SetName(L"still mine"));
+}
+
+TEST_F(SaveCopy, TellsTheKindOfWhatItWrote) {
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(FileMob(1)));
+    for (const aafUID_t& kind : {kAAFFileKind_Aaf512Binary, kAAFFileKind_Aaf4KBinary}) {
+        const std::wstring path = Path("kind.aaf");
+        Copy(path, kind);
+        aafUID_t found{};
+        aafBool is = kAAFFalse;
+        EXPECT_EQ(AAFRESULT_SUCCESS, AAFFileIsAAFFile(path.c_str(), &found, &is));
+        EXPECT_EQ(kAAFTrue, is);
+        EXPECT_EQ(kind, found);
+        EXPECT_EQ(AAFRESULT_SUCCESS, AAFFileIsAAFFileKind(path.c_str(), &kind, &is));
+        EXPECT_EQ(kAAFTrue, is);
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  AAFFileIsAAFFileKind(path.c_str(), &kAAFFileKind_AafXmlText, &is));
+        EXPECT_EQ(kAAFFalse, is);
+    }
+}
+
+TEST_F(SaveCopy, RefusesKindsAndFlagsThatItDoesNotKnow) {
+    Ptr<IAAFFile> made;
+    const std::wstring path = Path("never.aaf");
+    EXPECT_EQ(AAFRESULT_FILEKIND_NOT_REGISTERED,
+              AAFFileOpenNewModifyEx(path.c_str(), &kAAFFileKind_AafXmlText, 0, &product_.ident,
+                                     made.Out()));
+    EXPECT_EQ(AAFRESULT_BAD_FLAGS, AAFFileOpenNewModifyEx(path.c_str(), &kAAFFileKind_DontCare,
+                                                          0x40, &product_.ident, made.Out()));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM,
+              AAFFileOpenNewModifyEx(path.c_str(), nullptr, 0, &product_.ident, made.Out()));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, AAFFileOpenNewModify(path.c_str(), 0, nullptr, made.Out()));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, AAFFileOpenNewModify(nullptr, 0, &product_.ident, made.Out()));
+}
+
+TEST_F(SaveCopy, RefusesWhatIsNoAafFile) {
+    Ptr<IAAFFile> read;
+    const std::wstring missing = Path("missing.aaf");
+    EXPECT_EQ(AAFRESULT_FILE_NOT_FOUND, AAFFileOpenExistingRead(missing.c_str(), 0, read.Out()));
+    const std::wstring text = Path("text.aaf");
+    std::ofstream(std::filesystem::path(text)) << "no compound file, but long enough for one";
+    EXPECT_EQ(AAFRESULT_NOT_AAF_FILE, AAFFileOpenExistingRead(text.c_str(), 0, read.Out()));
+    aafUID_t kind{};
+    aafBool is = kAAFTrue;
+    EXPECT_EQ(AAFRESULT_SUCCESS, AAFFileIsAAFFile(text.c_str(), &kind, &is));
+    EXPECT_EQ(kAAFFalse, is);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, AAFFileOpenExistingRead(nullptr, 0, read.Out()));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, AAFFileOpenExistingRead(text.c_str(), 0, nullptr));
+}
+
+TEST_F(SaveCopy, ChangesAnExistingFileAndSaysWho) {
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(FileMob(1)));
+    const std::wstring path = Path("change.aaf");
+    Copy(path);
+    {
+        Ptr<IAAFFile> file;
+        Ptr<IAAFHeader> header;
+        Ptr<IAAFMob> mob;
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  AAFFileOpenExistingModify(path.c_str(), 0, &product_.ident, file.Out()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(1), mob.Out()));
+        EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L"changed"));
+        EXPECT_EQ(AAFRESULT_SUCCESS, file->Save());
+    }
+    Ptr<IAAFFile> file;
+    Ptr<IAAFHeader> header;
+    Ptr<IAAFMob> mob;
+    aafUInt32 count = 0;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, file.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, header->CountIdentifications(&count));
+    EXPECT_EQ(2u, count);
+    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(1), mob.Out()));
+    EXPECT_EQ(L"changed", TextOf<IAAFMob>(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
+}
+
+TEST_F(SaveCopy, WarnsOfUnsavedChangesWhenAsked) {
+    Ptr<IAAFFile> file =
+        NewFile(Path("dirty.aaf"), kAAFFileKind_DontCare, AAF_FILE_MODE_CLOSE_FAIL_DIRTY);
+    EXPECT_EQ(AAFRESULT_UNSAVED_CHANGES, file->Close());
+    EXPECT_EQ(AAFRESULT_SUCCESS, file->Save());
+    EXPECT_EQ(AAFRESULT_SUCCESS, file->Close());
+}
+
+TEST_F(SaveCopy, FailsWhereNothingCanBeWritten) {
+    Ptr<IAAFFile> target = NewFile(Path("no such folder/x.aaf"));
+    EXPECT_LT(file_->SaveCopyAs(target), 0);
+}
+
+TEST_F(SaveCopy, ClonesSingleMobsWithThoseTheyReferTo) {
+    DescribeClip();
+    Ptr<IAAFFile> alone = NewFile(Path("alone.aaf"));
+    Ptr<IAAFFile> all = NewFile(Path("all.aaf"));
+    Ptr<IAAFHeader> header;
+    Ptr<IAAFMob> clone;
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, master_->CloneExternal(2, 0, alone, clone.Out()));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, master_->CloneExternal(0, 0, nullptr, clone.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              master_->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, alone, clone.Out()));
+    EXPECT_EQ(Comments(master_), Comments(clone));
+    ASSERT_EQ(AAFRESULT_SUCCESS, alone->GetHeader(header.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, header->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(1u, count);
+    EXPECT_EQ(AAFRESULT_DUPLICATE_MOBID,
+              master_->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, alone, clone.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              master_->CloneExternal(kAAFFollowDepend, kAAFNoIncludeMedia, all, clone.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, all->GetHeader(header.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, header->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(3u, count);
+}
+
+TEST_F(SaveCopy, CarriesEssence) {
+    Ptr<IAAFMob> mob = FileMob(1);
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
+    Ptr<IAAFEssenceData> data = Make<IAAFEssenceData>(AUID_AAFEssenceData);
+    ASSERT_EQ(AAFRESULT_SUCCESS, data->Initialize(As<IAAFSourceMob>(mob)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddEssenceData(data));
+    std::vector<aafUInt8> bytes(100000, 7);
+    aafUInt32 count = 0;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              data->Write(static_cast<aafUInt32>(bytes.size()), bytes.data(), &count));
+    const std::wstring path = Path("essence.aaf");
+    Copy(path);
+    Ptr<IAAFFile> read;
+    Ptr<IAAFHeader> header;
+    aafLength_t size = 0;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, read.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, read->GetHeader(header.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupEssenceData(MobId(1), data.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, data->GetSize(&size));
+    EXPECT_EQ(100000, size);
+}
+
+}  // namespace aaf_test

@@ -1,0 +1,262 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "tests/unit/aaf_library/objects/TransientFile.h"
+
+namespace aaf_test {
+
+using Slot = TransientFile;
+using SourceMob = TransientFile;
+
+namespace {
+
+std::wstring NameOf(IAAFMobSlot* slot) {
+    return TextOf<IAAFMobSlot>(slot, &IAAFMobSlot::GetNameBufLen, &IAAFMobSlot::GetName);
+}
+
+}  // namespace
+
+TEST_F(Slot, StartsWithoutNameNumberAndSegment) {
+    Ptr<IAAFTimelineMobSlot> timeline = Make<IAAFTimelineMobSlot>(AUID_AAFTimelineMobSlot);
+    Ptr<IAAFMobSlot> slot = As<IAAFMobSlot>(timeline);
+    aafSlotID_t id = 9;
+    aafUInt32 number = 9;
+    aafPosition_t origin = 9;
+    aafRational_t rate{9, 9};
+    wchar_t name[4];
+    Ptr<IAAFSegment> segment;
+    Ptr<IAAFDataDef> dataDef;
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetSlotID(&id));
+    EXPECT_EQ(0u, id);
+    EXPECT_EQ(AAFRESULT_SUCCESS, timeline->GetEditRate(&rate));
+    EXPECT_EQ(0, rate.numerator);
+    EXPECT_EQ(0, rate.denominator);
+    EXPECT_EQ(AAFRESULT_SUCCESS, timeline->GetOrigin(&origin));
+    EXPECT_EQ(0, origin);
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, slot->GetName(name, sizeof name));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, slot->GetPhysicalNum(&number));
+    EXPECT_EQ(AAFRESULT_NULLOBJECT, slot->GetSegment(segment.Out()));
+    EXPECT_EQ(AAFRESULT_NULLOBJECT, slot->GetDataDef(dataDef.Out()));
+}
+
+TEST_F(Slot, TakesAnyPhysicalNumberAndName) {
+    Ptr<IAAFMobSlot> slot = Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot);
+    aafUInt32 number = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetPhysicalNum(0xFFFFFFFF));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetPhysicalNum(&number));
+    EXPECT_EQ(0xFFFFFFFFu, number);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, slot->SetName(nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetName(L""));
+    EXPECT_EQ(L"", NameOf(slot));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, slot->GetPhysicalNum(nullptr));
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, slot->GetSlotID(nullptr));
+}
+
+TEST_F(Slot, GivesTheStoredSegmentItself) {
+    Ptr<IAAFMobSlot> slot = Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot);
+    Ptr<IAAFSourceClip> clip = Clip(5);
+    Ptr<IAAFSegment> segment = As<IAAFSegment>(clip);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, slot->SetSegment(nullptr));
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->SetSegment(segment));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, slot->SetSegment(segment));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED,
+              Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot)->SetSegment(segment));
+    Ptr<IAAFSegment> found;
+    Ptr<IAAFDataDef> dataDef;
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(found.Out()));
+    EXPECT_EQ(segment.get(), found.get());
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetDataDef(dataDef.Out()));
+    EXPECT_EQ(DataDef(kAAFDataDef_LegacyPicture).get(), dataDef.get());
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->SetSegment(As<IAAFSegment>(Clip(6))));
+    EXPECT_EQ(AAFRESULT_SUCCESS, Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot)->SetSegment(segment));
+}
+
+TEST_F(Slot, HasMarksThatAreAbsentAtFirst) {
+    Ptr<IAAFTimelineMobSlot2> slot = Make<IAAFTimelineMobSlot2>(AUID_AAFTimelineMobSlot);
+    aafPosition_t at = 0;
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, slot->GetMarkIn(&at));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, slot->GetMarkOut(&at));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, slot->GetUserPos(&at));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetMarkIn(-1));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetMarkOut(2));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetUserPos(3));
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetMarkIn(&at));
+    EXPECT_EQ(-1, at);
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetMarkOut(&at));
+    EXPECT_EQ(2, at);
+    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetUserPos(&at));
+    EXPECT_EQ(3, at);
+}
+
+TEST_F(SourceMob, HasNoDescriptorAtFirst) {
+    Ptr<IAAFSourceMob> mob = Make<IAAFSourceMob>(AUID_AAFSourceMob);
+    Ptr<IAAFEssenceDescriptor> descriptor;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetEssenceDescriptor(descriptor.Out()));
+    EXPECT_EQ(nullptr, descriptor.get());
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->GetEssenceDescriptor(nullptr));
+}
+
+TEST_F(SourceMob, ReplacesItsDescriptorAndFreesTheOldOne) {
+    Ptr<IAAFSourceMob> mob = Make<IAAFSourceMob>(AUID_AAFSourceMob);
+    Ptr<IAAFSourceMob> other = Make<IAAFSourceMob>(AUID_AAFSourceMob);
+    Ptr<IAAFEssenceDescriptor> first = Make<IAAFEssenceDescriptor>(AUID_AAFCDCIDescriptor);
+    Ptr<IAAFEssenceDescriptor> second = Make<IAAFEssenceDescriptor>(AUID_AAFImportDescriptor);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->SetEssenceDescriptor(nullptr));
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->SetEssenceDescriptor(first));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, mob->SetEssenceDescriptor(first));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, other->SetEssenceDescriptor(first));
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetEssenceDescriptor(second));
+    EXPECT_EQ(AAFRESULT_SUCCESS, other->SetEssenceDescriptor(first));
+    Ptr<IAAFEssenceDescriptor> found;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetEssenceDescriptor(found.Out()));
+    EXPECT_EQ(second.get(), found.get());
+}
+
+TEST_F(SourceMob, AppendsNilReferencesAlsoUnderOneId) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFSourceMob);
+    Ptr<IAAFSourceMob> source = As<IAAFSourceMob>(mob);
+    Ptr<IAAFDataDef> sound = DataDef(kAAFDataDef_LegacySound);
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, source->AddNilReference(1, 5, nullptr, {25, 1}));
+    EXPECT_EQ(AAFRESULT_BADRATE, source->AddNilReference(1, 5, sound, {25, 0}));
+    EXPECT_EQ(AAFRESULT_SUCCESS, source->AddNilReference(1, 12960000, sound, {25, 1}));
+    EXPECT_EQ(AAFRESULT_SUCCESS, source->AddNilReference(1, -5, sound, {25, 1}));
+    aafUInt32 count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&count));
+    EXPECT_EQ(2u, count);
+
+    Ptr<IAAFMobSlot> slot;
+    Ptr<IAAFSegment> segment;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(1, slot.Out()));
+    EXPECT_EQ(L"Test", NameOf(slot));
+    aafPosition_t origin = 9;
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTimelineMobSlot>(slot)->GetOrigin(&origin));
+    EXPECT_EQ(0, origin);
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    aafSourceRef_t reference{MobId(1), 1, 1};
+    aafLength_t length = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&reference));
+    EXPECT_TRUE(SameMobId(aafMobID_t{}, reference.sourceID));
+    EXPECT_EQ(0u, reference.sourceSlotID);
+    EXPECT_EQ(0, reference.startTime);
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
+    EXPECT_EQ(12960000, length);
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetSlotAt(1, slot.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, As<IAAFComponent>(segment)->GetLength(&length));
+}
+
+TEST_F(SourceMob, PutsNewReferencesIntoSlotsOldOrNew) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFSourceMob);
+    Ptr<IAAFSourceMob> source = As<IAAFSourceMob>(mob);
+    Ptr<IAAFDataDef> picture = DataDef(kAAFDataDef_LegacyPicture);
+    const aafSourceRef_t reference{MobId(3), 4, 5};
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, source->NewPhysSourceRef({25, 1}, 7, nullptr, reference, 10));
+    // The rate is not checked and the target need not exist.
+    EXPECT_EQ(AAFRESULT_SUCCESS, source->NewPhysSourceRef({30, 0}, 7, picture, reference, 10));
+    Ptr<IAAFMobSlot> slot;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(7, slot.Out()));
+    EXPECT_EQ(L"ASlot", NameOf(slot));
+    slot->SetName(L"mine");
+
+    EXPECT_EQ(AAFRESULT_SUCCESS, source->NewPhysSourceRef({25, 1}, 7, picture, reference, 20));
+    aafUInt32 count = 0;
+    aafRational_t rate{};
+    aafLength_t length = 0;
+    Ptr<IAAFSegment> segment;
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&count));
+    EXPECT_EQ(1u, count);
+    EXPECT_EQ(L"mine", NameOf(slot));
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTimelineMobSlot>(slot)->GetEditRate(&rate));
+    EXPECT_EQ(30, rate.numerator);
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
+    EXPECT_EQ(20, length);
+    aafSourceRef_t found{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&found));
+    EXPECT_TRUE(SameMobId(MobId(3), found.sourceID));
+    EXPECT_EQ(4u, found.sourceSlotID);
+    EXPECT_EQ(5, found.startTime);
+}
+
+TEST_F(SourceMob, RefusesADataDefinitionThatTheDictionaryLacks) {
+    Ptr<IAAFDataDef> unknown = Make<IAAFDataDef>(AUID_AAFDataDef);
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              unknown->Initialize(ncfGuid("ABCDEF00-0000-0000-0000-000000000001"), L"n", L"d"));
+    EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS,
+              Make<IAAFMasterMob>(AUID_AAFMasterMob)
+                  ->NewPhysSourceRef({25, 1}, 1, unknown, aafSourceRef_t{}, 10));
+}
+
+TEST_F(SourceMob, AppendsToSequencesOnly) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFSourceMob);
+    Ptr<IAAFSourceMob> source = As<IAAFSourceMob>(mob);
+    Ptr<IAAFDataDef> picture = DataDef(kAAFDataDef_LegacyPicture);
+    EXPECT_EQ(AAFRESULT_SUCCESS,
+              source->AppendPhysSourceRef({25, 1}, 1, picture, aafSourceRef_t{}, 10));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED,
+              source->AppendPhysSourceRef({25, 1}, 1, picture, aafSourceRef_t{}, 10));
+    Ptr<IAAFSequence> sequence = Make<IAAFSequence>(AUID_AAFSequence);
+    sequence->Initialize(picture);
+    Ptr<IAAFTimelineMobSlot> slot;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(sequence), 2,
+                                                            L"", 0, slot.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS,
+              source->AppendPhysSourceRef({25, 1}, 2, picture, aafSourceRef_t{}, 10));
+    aafUInt32 count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, sequence->CountComponents(&count));
+    EXPECT_EQ(1u, count);
+}
+
+TEST_F(SourceMob, AppendsSlotsOfTimecodeAndEdgecode) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFSourceMob);
+    Ptr<IAAFSourceMob> source = As<IAAFSourceMob>(mob);
+    aafUInt8 header[8] = {'A', 'B'};
+    EXPECT_EQ(AAFRESULT_INVALID_TIMECODE,
+              source->AppendTimecodeSlot({25, 1}, 1, aafTimecode_t{0, 2, 25}, 100));
+    EXPECT_EQ(AAFRESULT_SUCCESS,
+              source->AppendTimecodeSlot({25, 1}, 1, aafTimecode_t{0, 0, 25}, 100));
+    EXPECT_EQ(AAFRESULT_SUCCESS,
+              source->AppendEdgecodeSlot({24, 1}, 2, 5, 100, kAAFFt35MM, kAAFEtKeycode, header));
+    EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE,
+              source->AppendEdgecodeSlot({24, 1}, 2, 5, 100, 5, kAAFEtKeycode, header));
+    Ptr<IAAFMobSlot> slot;
+    Ptr<IAAFSegment> segment;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(1, slot.Out()));
+    EXPECT_EQ(L"Timecode", NameOf(slot));
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(2, slot.Out()));
+    EXPECT_EQ(L"Edgecode", NameOf(slot));
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    aafEdgecode_t code{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFEdgecode>(segment)->GetEdgecode(&code));
+    EXPECT_EQ(5, code.startFrame);
+    EXPECT_EQ(kAAFFt35MM, code.filmKind);
+    EXPECT_EQ('B', code.header[1]);
+}
+
+TEST_F(SourceMob, IsReachedFromAMasterMob) {
+    Ptr<IAAFMob> file = FileMob(1);
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    Ptr<IAAFMasterMob> master = As<IAAFMasterMob>(mob);
+    Ptr<IAAFDataDef> picture = DataDef(kAAFDataDef_LegacyPicture);
+    EXPECT_EQ(AAFRESULT_SLOT_NOT_FOUND,
+              master->AddMasterSlot(picture, 2, As<IAAFSourceMob>(file), 5, L"V1"));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              master->AddMasterSlot(picture, 1, As<IAAFSourceMob>(file), 5, L"V1"));
+    Ptr<IAAFMobSlot> slot;
+    Ptr<IAAFSegment> segment;
+    Ptr<IAAFMob> found;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(5, slot.Out()));
+    EXPECT_EQ(L"V1", NameOf(slot));
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSourceClip> clip = As<IAAFSourceClip>(segment);
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_ATTACHED, clip->ResolveRef(found.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
+    EXPECT_EQ(AAFRESULT_MOB_NOT_FOUND, clip->ResolveRef(found.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(file));
+    EXPECT_EQ(AAFRESULT_SUCCESS, clip->ResolveRef(found.Out()));
+    EXPECT_EQ(file.get(), found.get());
+    ASSERT_EQ(AAFRESULT_SUCCESS, file->GetSlotAt(0, slot.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    EXPECT_EQ(AAFRESULT_TRAVERSAL_NOT_POSS, As<IAAFSourceClip>(segment)->ResolveRef(found.Out()));
+}
+
+}  // namespace aaf_test
