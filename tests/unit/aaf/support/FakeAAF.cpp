@@ -61,7 +61,11 @@ HRESULT FakeAAF::OpenTransient(aafProductIdentification_t* ident, IAAFFile** fil
 
 IAAFFile* FakeAAF::newFile() {
     auto* const file = new FakeAAFObject(*this, nextName("File"));
-    file->keep(dictionary_);
+    // A file has a dictionary of its own.
+    auto* const dictionary = new FakeAAFObject(*this, "Dictionary");
+    file->keep(dictionary);
+    file->definitions.emplace_back(IID_IAAFDictionary, dictionary);
+    dictionary->release();
     auto* const face = static_cast<IAAFFile*>(file->face(IID_IAAFFile));
     file->release();
     return face;

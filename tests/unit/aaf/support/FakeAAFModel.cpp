@@ -49,7 +49,16 @@ struct FileFace final : FakeAAFFace<IAAFFile> {
     using FakeAAFFace::FakeAAFFace;
     HRESULT GetHeader(IAAFHeader** header) override {
         const HRESULT refused = note("GetHeader");
-        return refused ? refused : self_.create("Header", IID_IAAFHeader, (void**)header);
+        if (refused) {
+            return refused;
+        }
+        FakeAAFObject* const made = self_.make("Header");
+        made->keep(self_.definition(IID_IAAFDictionary));
+        made->definitions = self_.definitions;
+        *header = static_cast<IAAFHeader*>(made->face(IID_IAAFHeader));
+        self_.keep(made);
+        made->release();
+        return AAFRESULT_SUCCESS;
     }
 };
 
@@ -58,7 +67,8 @@ struct HeaderFace final : FakeAAFFace<IAAFHeader> {
     HRESULT GetDictionary(IAAFDictionary** dictionary) override {
         const HRESULT refused = note("GetDictionary");
         if (!refused) {
-            *dictionary = self_.library().dictionary<IAAFDictionary>();
+            *dictionary = static_cast<IAAFDictionary*>(
+                self_.definition(IID_IAAFDictionary)->face(IID_IAAFDictionary));
         }
         return refused;
     }
@@ -145,7 +155,8 @@ struct ClassDefFace final : FakeAAFFace<IAAFClassDef> {
     HRESULT CreateInstance(REFIID iid, IUnknown** object) override {
         const HRESULT refused = note("CreateInstance");
         // "ClassDefSequence1" makes "Sequence1".
-        const std::string className = self_.name().substr(8, self_.name().size() - 9);
+        const std::string& name = self_.name();
+        const std::string className = name.substr(8, name.find_last_not_of("0123456789") - 7);
         return refused ? refused : self_.create(className, iid, (void**)object);
     }
     HRESULT LookupPropertyDef(aafUID_constref id, IAAFPropertyDef** out) override {
