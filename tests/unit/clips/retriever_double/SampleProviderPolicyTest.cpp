@@ -1,0 +1,295 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// The rule that decides whether the host reads essence by itself, with the
+// retriever's answer given by the test.
+
+#include "source/clips/SampleProviderPolicy.h"
+
+#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
+#include "tests/unit/clips/ClipFixture.h"
+
+namespace {
+
+// What the retriever stands for in this program.
+struct RetrieverDouble {
+    bool exists = true;
+    NCFRESULT result = NCF_OK;
+    const BaseClip* asked = nullptr;
+    AAFInfo* record = nullptr;
+};
+RetrieverDouble retriever;
+
+alignas(QuickTimeToAAFInfoRetriever) unsigned char place[sizeof(QuickTimeToAAFInfoRetriever)];
+
+}  // namespace
+
+QuickTimeToAAFInfoRetriever* QuickTimeToAAFInfoRetriever::GetInstance() {
+    return retriever.exists ? reinterpret_cast<QuickTimeToAAFInfoRetriever*>(place) : nullptr;
+}
+
+NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const BaseClip* media,
+                                                                   AAFInfo* aafInfo,
+                                                                   ncfUInt32* vcid) {
+    retriever.asked = media;
+    retriever.record = aafInfo;
+    *vcid = 4711;
+    return retriever.result;
+}
+
+namespace {
+
+class SampleProviderPolicy : public ClipTest {
+protected:
+    SampleProviderPolicy() {
+        retriever = RetrieverDouble();
+        parser->AddVideoTrack(1);
+        parser->AddAudioTrack(2);
+        Load();
+        log->clear();
+        host->console().clear();
+    }
+    FakeAudioTrack& Sound() { return *parser->audioTracks[0]; }
+    // A refusal tells its reason twice.
+    void ExpectReason(const std::string& function, const std::string& reason) {
+        EXPECT_EQ(Console(2, reason), 1) << reason;
+        EXPECT_EQ(log->count(function + reason), 1) << reason;
+    }
+    NCFSmartPtr<INCFConsole> TheConsole() { return NCFSmartPtr<INCFConsole>(&host->console()); }
+
+    AAFInfo info;
+    ncfUInt64 samples = 5;
+};
+
+}  // namespace
+
+// --- picture ----------------------------------------------------------------------------
+
+TEST_F(SampleProviderPolicy, IsNativeWhenTheRetrieverKnowsThePicture) {
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 1);
+    EXPECT_EQ(retriever.asked, clip.get());
+    EXPECT_EQ(retriever.record, &info);
+    EXPECT_TRUE(host->console().lines().empty());
+}
+
+TEST_F(SampleProviderPolicy, ProvidesSilentlyWhatTheRetrieverDoesNotKnow) {
+    for (const NCFRESULT result : {NCF_E_NOTSUPPORTED, NCF_E_PARAMETERNOTAVAILABLE, NCF_E_FAIL}) {
+        retriever.result = result;
+        EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
+    }
+    retriever.exists = false;
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
+    EXPECT_TRUE(host->console().lines().empty());
+}
+
+TEST_F(SampleProviderPolicy, ProvidesMoviesWithExternalMediaAtTheFirstCheck) {
+    parser->selfContained = 0;
+    journal.clear();
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
+    ExpectReason("BaseClip::CommonSampleProviderCheck", "The movie is not self contained.");
+    EXPECT_EQ(journal.lines().front(), "parser.IsMovieSelfContained");
+    EXPECT_EQ(retriever.asked, nullptr);
+    host->console().clear();
+    log->clear();
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
+    ExpectReason("BaseClip::CommonSampleProviderCheck", "The movie is not self contained.");
+}
+
+TEST_F(SampleProviderPolicy, GoesOnWhenSelfContainmentCannotBeAsked) {
+    parser->results["IsMovieSelfContained"] = NCF_E_FAIL;
+    EXPECT_EQ(clip->CommonSampleProviderCheck(), 1);
+}
+
+TEST_F(SampleProviderPolicy, ProvidesPicturesOfSeveralDescriptions) {
+    Video().descriptionCount = 2;
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
+    ExpectReason("QuickTimeClip::IsVideoSampleProviderMedia",
+                 "The movie contains video track with more than one video image description.");
+}
+
+TEST_F(SampleProviderPolicy, ProvidesMoviesOfSeveralPictureTracks) {
+    parser->AddVideoTrack(9);
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
+    ExpectReason("QuickTimeClip::IsVideoSampleProviderMedia",
+                 "The movie contains more than 1 video track.");
+}
+
+TEST_F(SampleProviderPolicy, ProvidesPicturesThatShowAlpha) {
+    Picture().hasAlpha = 1;
+    Load();
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 1) << "alpha is ignored";
+    GiveSettings(NCF_OK, 0);
+    Load();
+    log->clear();
+    host->console().clear();
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
+    ExpectReason("QuickTimeClip::IsVideoSampleProviderMedia", "The movie contains alpha.");
+}
+
+TEST_F(SampleProviderPolicy, HandsFailuresAboutThePictureOn) {
+    Video().results["GetSampleDescriptionCount"] = NCF_E_ABORT;
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), NCF_E_ABORT);
+    EXPECT_EQ(log->count(ReturnRecord("80000007", "vti->GetSampleDescriptionCount(&descCount)",
+                                      "QuickTimeClip::IsVideoSampleProviderMedia")),
+              1);
+    Video().results.clear();
+    parser->results["GetVideoTrackCount"] = NCF_E_FAIL;
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), NCF_E_FAIL);
+    EXPECT_EQ(log->count(ReturnRecord("80000008", "qtParser_->GetVideoTrackCount(&trackCount)",
+                                      "QuickTimeClip::IsVideoSampleProviderMedia")),
+              1);
+}
+
+TEST_F(SampleProviderPolicy, HasNoAnswerAboutThePictureOfASoundOnlyMovie) {
+    parser->videoTracks[0]->Release();
+    parser->videoTracks.clear();
+    Load();
+    EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), NCF_E_POINTER);
+    EXPECT_EQ(log->count("CHK_PTR(vti.inArg())QuickTimeClip::IsVideoSampleProviderMedia"), 1);
+}
+
+// --- sound ---------------------------------------------------------------------------------
+
+TEST_F(SampleProviderPolicy, IsNativeForPlainLinearSound) {
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 1);
+    Sound().description->bits = 24;
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 1);
+    EXPECT_EQ(samples, 5u) << "the number of samples is not written";
+    EXPECT_TRUE(host->console().lines().empty());
+}
+
+TEST_F(SampleProviderPolicy, ProvidesCompressedSoundWithoutAReason) {
+    Sound().description->lpcm = 0;
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
+    EXPECT_TRUE(host->console().lines().empty());
+}
+
+TEST_F(SampleProviderPolicy, ProvidesOtherDepthsOfSound) {
+    for (const ncfUInt32 bits : {0u, 8u, 20u, 32u}) {
+        Sound().description->bits = bits;
+        log->clear();
+        host->console().clear();
+        EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
+        ExpectReason("BaseClip::IsSupportedBitPerChannel",
+                     "An audio bit rate of " + std::to_string(bits) +
+                         " was found but only bit rates of 16 and 24 are natively supported.");
+    }
+}
+
+TEST_F(SampleProviderPolicy, ProvidesSoundWithNonTrivialEdits) {
+    Sound().proportional = 0;
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
+    ExpectReason("QuickTimeClip::IsAudioSampleProviderMedia",
+                 "The audio track contains non-trivial edit list(s).");
+}
+
+TEST_F(SampleProviderPolicy, AcceptsEditsThatStayInProportion) {
+    Sound().linear = 0;
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 1);
+}
+
+TEST_F(SampleProviderPolicy, ProvidesSoundOfVaryingSampleSize) {
+    Sound().results["HasConstantSampleRate"] = 1;
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
+    ExpectReason("QuickTimeClip::IsAudioSampleProviderMedia",
+                 "The audio track contains variable sample size.");
+}
+
+TEST_F(SampleProviderPolicy, ProvidesSoundThatPlaysAPartOfItsMedia) {
+    Sound().trackDuration = 9999;
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
+    ExpectReason("QuickTimeClip::IsAudioSampleProviderMedia",
+                 "The audio track length doesn't match corresponding media length.");
+}
+
+TEST_F(SampleProviderPolicy, HandsFailuresAboutSoundOn) {
+    struct {
+        FakeCalls* calls;
+        const char* operation;
+        const char* record;
+    } const kSteps[] = {
+        {Sound().description, "IsLPCM",
+         "IsAudioLPCM(qtTrack, &isLPCM) : BaseClip::IsAudioSampleProviderMedia"},
+        {Sound().description, "GetSampleRate",
+         "GetAudioTrackMetadata(qtTrack, &audioInfo) : BaseClip::IsAudioSampleProviderMedia"},
+        {&Sound(), "IsTrackLinear",
+         "ati->IsTrackLinear(&linear, &areMediaAndTrackTimesProportional, NULL, NULL) : "
+         "QuickTimeClip::IsAudioSampleProviderMedia"},
+        {&Sound(), "HasConstantSampleRate",
+         "ati->HasConstantSampleRate(NULL) : QuickTimeClip::IsAudioSampleProviderMedia"},
+        {&Sound(), "GetTrackDuration",
+         "CalculateAudioTrackLengthInSamples(qtTrack, &trackNumSamples) : "
+         "QuickTimeClip::IsAudioSampleProviderMedia"},
+        {&Sound(), "GetMediaDuration",
+         "CalculateMediaOnTrackLengthInSamples(qtTrack, &mediaNumSamples) : "
+         "QuickTimeClip::IsAudioSampleProviderMedia"},
+    };
+    for (const auto& step : kSteps) {
+        step.calls->results[step.operation] = NCF_E_ABORT;
+        log->clear();
+        EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), NCF_E_ABORT) << step.operation;
+        EXPECT_EQ(log->count(std::string("NCF_RETURN(0x80000007): ") + step.record), 1)
+            << step.operation;
+        step.calls->results.clear();
+    }
+    EXPECT_EQ(clip->IsAudioSampleProviderMedia(99, &samples), NCF_E_NOTFOUND);
+    EXPECT_EQ(log->count(ReturnRecord(
+                  "8000000c", "BaseClip::IsAudioSampleProviderMedia(qtTrack, numAudioSamples)",
+                  "QuickTimeClip::IsAudioSampleProviderMedia")),
+              1);
+}
+
+TEST_F(SampleProviderPolicy, KnowsLinearSoundByOneCode) {
+    EXPECT_EQ(clip->IsLPCMAudioByFormatID(0x6C70636D), 1);
+    EXPECT_TRUE(host->console().lines().empty());
+    EXPECT_EQ(clip->IsLPCMAudioByFormatID(0x61616320), 0);
+    ExpectReason("BaseClip::IsLPCMAudioByFormatID",
+                 "The FOURCC audio code of aac  is not natively supported.");
+    EXPECT_EQ(clip->IsLPCMAudioByFormatID(0x25736E25), 0);
+    ExpectReason("BaseClip::IsLPCMAudioByFormatID",
+                 "The FOURCC audio code of %sn% is not natively supported.");
+}
+
+// --- what the description asks ------------------------------------------------------------------
+
+TEST_F(SampleProviderPolicy, TellsTheUserOfAForcedPicture) {
+    EXPECT_EQ(MovieRequiresSampleProviderForVideo(TheConsole(), clip, &info), 1);
+    EXPECT_TRUE(host->console().lines().empty());
+    retriever.result = NCF_E_NOTSUPPORTED;
+    EXPECT_EQ(MovieRequiresSampleProviderForVideo(TheConsole(), clip, &info), 0);
+    EXPECT_EQ(Console(2, "Forcing sample provider mode for video.\n"), 1);
+    EXPECT_EQ(log->count("MovieRequiresSampleProviderForVideoForcing sample provider mode for "
+                         "video!"),
+              1);
+}
+
+TEST_F(SampleProviderPolicy, TellsTheUserOfForcedSound) {
+    EXPECT_EQ(MovieRequiresSampleProviderForAudio(TheConsole(), clip, 2, &samples), 1);
+    EXPECT_TRUE(host->console().lines().empty());
+    Sound().description->lpcm = 0;
+    EXPECT_EQ(MovieRequiresSampleProviderForAudio(TheConsole(), clip, 2, &samples), 0);
+    EXPECT_EQ(Console(2, "Forcing sample provider mode for audio track 2.\n"), 1);
+    EXPECT_EQ(log->count("MovieRequiresSampleProviderForAudioForcing sample provider mode for "
+                         "audio track: 2 is enabled!"),
+              1);
+}
+
+TEST_F(SampleProviderPolicy, TellsNothingOfFailures) {
+    EXPECT_EQ(MovieRequiresSampleProviderForAudio(TheConsole(), clip, 99, &samples),
+              NCF_E_NOTFOUND);
+    Video().results["GetSampleDescriptionCount"] = NCF_E_ABORT;
+    EXPECT_EQ(MovieRequiresSampleProviderForVideo(TheConsole(), clip, &info), NCF_E_ABORT);
+    EXPECT_TRUE(host->console().lines().empty());
+}
+
+TEST_F(SampleProviderPolicy, ChecksTheArgumentsOfBothQuestions) {
+    std::tr1::shared_ptr<BaseClip> none;
+    EXPECT_EQ(MovieRequiresSampleProviderForVideo(nullptr, none, &info), NCF_E_INVALIDARG);
+    EXPECT_EQ(log->records().back().text, "CHK_INARG(console)MovieRequiresSampleProviderForVideo");
+    EXPECT_EQ(MovieRequiresSampleProviderForVideo(TheConsole(), none, &info), NCF_E_INVALIDARG);
+    EXPECT_EQ(log->records().back().text,
+              "CHK_INARG(media.get())MovieRequiresSampleProviderForVideo");
+    EXPECT_EQ(MovieRequiresSampleProviderForAudio(TheConsole(), none, 2, &samples), NCF_E_POINTER);
+    EXPECT_EQ(log->records().back().text,
+              "CHK_PTR(media.get())MovieRequiresSampleProviderForAudio");
+}
