@@ -30,7 +30,7 @@ protected:
     }
 
     static std::filesystem::path Module(const std::string& fault) {
-        return std::filesystem::path(TINY_MODULES) / ("module_" + fault + ".nvx");
+        return std::filesystem::path(TINY_MODULES) / ("tiny_module_" + fault + ".nvx");
     }
 
     // Loads a module that must not load, and gives the reason.
