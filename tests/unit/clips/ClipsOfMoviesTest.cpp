@@ -36,7 +36,7 @@ protected:
         host.reset();
         std::remove(path.c_str());
         EXPECT_EQ(LiveFakes(), 0);
-        EXPECT_EQ(host::LiveObjects(), objectsBefore);
+        EXPECT_EQ(host::LiveObjectCount(), objectsBefore);
     }
     NCFRESULT Load(const std::vector<Track>& tracks) {
         movie.tracks = tracks;
@@ -75,7 +75,7 @@ protected:
         return content;
     }
 
-    const int objectsBefore = static_cast<int>(host::LiveObjects());
+    const std::int64_t objectsBefore = host::LiveObjectCount();
     const std::string path = testing::TempDir() + "clip_of_movie_" +
                              testing::UnitTest::GetInstance()->current_test_info()->name() + ".mov";
     std::unique_ptr<FakeHost> host;
@@ -108,6 +108,7 @@ TEST_F(ClipsOfMovies, AreLoadedFromHeadersInFrontAndBehind) {
 TEST_F(ClipsOfMovies, AreLoadedFromCompressedHeaders) {
     movie.compressed = true;
     ASSERT_EQ(Load({video}), NCF_OK);
+    EXPECT_EQ(Rate(), (Rational{25, 1}));
     EXPECT_EQ(Length(), 100u);
 }
 
@@ -228,6 +229,7 @@ TEST_F(ClipsOfMovies, AreNotMadeOfMoviesWithoutPictureAndSound) {
 }
 
 TEST_F(ClipsOfMovies, AreNotMadeOfForeignFiles) {
+    const RecordingNMALog lines(1);
     for (const std::string& text : {std::string("RIFF....AVI LIST"), std::string(1, '\0'),
                                     std::string(20000, '\0'), std::string(5000, 'x')}) {
         EXPECT_EQ(Load(Bytes(text.begin(), text.end())), NMA_E_NOTINITIALIZED);
@@ -256,6 +258,7 @@ TEST_F(ClipsOfMovies, AnswerWithFailuresWhenTheyFailed) {
 }
 
 TEST_F(ClipsOfMovies, SurviveBeingCutAtEveryByteOfTheirHeader) {
+    const RecordingNMALog lines(1);
     movie.header = Place::kBeforeMedia;
     movie.tracks = {video, timecode};
     const MadeMovie made = Build(movie);
@@ -274,6 +277,7 @@ TEST_F(ClipsOfMovies, SurviveBeingCutAtEveryByteOfTheirHeader) {
 }
 
 TEST_F(ClipsOfMovies, SurviveTurnedBitsInTheirHeader) {
+    const RecordingNMALog lines(1);
     movie.header = Place::kBeforeMedia;
     movie.tracks = {video, sound};
     const MadeMovie made = Build(movie);
