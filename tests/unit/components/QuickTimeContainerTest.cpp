@@ -1,0 +1,239 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "source/components/QuickTimeContainer.h"
+
+#include "host_interfaces/aaf/AAFFile.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "reference_host/header_parser/QTParser.h"
+#include "tests/support/movies/Movie.h"
+#include "tests/unit/components/ComponentFixture.h"
+
+namespace {
+
+class FakeCapability : public FakeObject<INCFCapability> {
+public:
+    explicit FakeCapability(ncfUInt32 value) : value_(value) {}
+    NCFRESULT GetValue(ncfUInt32* value) override {
+        *value += value_;
+        return NCF_E_FAIL;  // the result is nobody's business
+    }
+
+private:
+    ncfUInt32 value_;
+};
+
+// A container over a sound movie: no data files are needed to describe it.
+class Container : public ComponentFixture {
+protected:
+    Container() {
+        host.maker(NCFCompID_QTParser, [](const GUID& iid, void** out) {
+            return host::MakeRef<header_parser::QTParser>()->QueryInterface(iid, out);
+        });
+    }
+    NCFSmartPtr<NMA::IMediaContainer3> container() {
+        return make<NMA::IMediaContainer3>(NMA::Impl::CreateQuickTimeContainer);
+    }
+    void useCapability(ncfUInt32 value) {
+        host.maker(CompID_Capability, [value](const GUID&, void** out) {
+            *out = static_cast<INCFCapability*>(new FakeCapability(value));
+            return NCF_OK;
+        });
+    }
+    std::filesystem::path writeMovie() {
+        movies::Movie movie;
+        movie.tracks.push_back(movies::VideoTrack(movies::VideoFormat(), 50, 25, 1));
+        const std::filesystem::path file = folder / "a.mov";
+        EXPECT_TRUE(movies::Build(movie).WriteTo(file.string()));
+        return file;
+    }
+};
+
+TEST_F(Container, AnswersToItsThreeGenerationsThroughOneTable) {
+    const auto newest = container();
+    NCFSmartPtr<NMA::IMediaContainer> first;
+    NCFSmartPtr<NMA::IMediaContainer2> second;
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    ASSERT_EQ(ncfQuery(newest.inArg(), first), NCF_OK);
+    ASSERT_EQ(ncfQuery(newest.inArg(), second), NCF_OK);
+    ASSERT_EQ(ncfQuery(newest.inArg(), clips), NCF_OK);
+    EXPECT_EQ(first.inArg(), static_cast<NMA::IMediaContainer*>(newest.inArg()));
+    EXPECT_EQ(second.inArg(), static_cast<NMA::IMediaContainer2*>(newest.inArg()));
+    NCFSmartPtr<NMA::IMediaVolume> volume;
+    EXPECT_EQ(ncfQuery(newest.inArg(), volume), NCF_E_NOINTERFACE);
+}
+
+TEST_F(Container, GivesItsFlagAndRefusesWhatItDoesNotDo) {
+    const auto object = container();
+    EXPECT_EQ(object->ContainerFlag(), 1);
+    EXPECT_EQ(object->ContainerUnsupportedA(nullptr, nullptr, nullptr), NCF_E_NOTIMPL);
+    EXPECT_EQ(object->ContainerUnsupportedB(nullptr), NCF_E_NOTIMPL);
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    ncfQuery(object.inArg(), clips);
+    EXPECT_EQ(clips->GetCount(), 1);
+    EXPECT_EQ(clips->GetClipPath(0, nullptr), NCF_E_NOTIMPL);
+}
+
+TEST_F(Container, NeedsHostFactoryAndConsoleButNoSettings) {
+    void* out = nullptr;
+    const auto create = [&](INCFUnknown* unknown) {
+        return NMA::Impl::CreateQuickTimeContainer(unknown, nullptr, NMA::IID_IMediaContainer3,
+                                                   &out);
+    };
+    EXPECT_EQ(create(nullptr), NCF_E_POINTER);
+    host.refuseQuery(IID_INCFConsole, NCF_E_NOINTERFACE);
+    EXPECT_EQ(create(host.unknown()), NCF_E_NOINTERFACE);
+    host.clearRefusals();
+    host.refuseQuery(IID_INCFComponentFactory, NCF_E_ACCESSDENIED);
+    EXPECT_EQ(create(host.unknown()), NCF_E_ACCESSDENIED);
+    host.clearRefusals();
+    host.refuseCreation(CompID_Capability, NCF_E_FAIL);
+    EXPECT_EQ(create(host.unknown()), NCF_OK);
+    static_cast<NMA::IMediaContainer3*>(out)->Release();
+}
+
+// --- capabilities and file types -----------------------------------------------------
+
+TEST_F(Container, TellsItsCapabilitiesByTheHostsPreference) {
+    ncfUInt32 flags = 0;
+    EXPECT_EQ(container()->GetCapabilities(nullptr), NCF_E_INVALIDARG);
+    EXPECT_EQ(container()->GetCapabilities(&flags), NCF_OK);
+    EXPECT_EQ(flags, 16387u + 256u) << "without the component";
+    useCapability(0);
+    EXPECT_EQ(container()->GetCapabilities(&flags), NCF_OK);
+    EXPECT_EQ(flags, 16387u + 256u);
+    useCapability(5);
+    EXPECT_EQ(container()->GetCapabilities(&flags), NCF_OK);
+    EXPECT_EQ(flags, 16387u + 512u) << "the value starts from 0";
+}
+
+TEST_F(Container, ListsItsFileTypes) {
+    const char* const extensions[] = {
+        "MOV", "MP4", "M4V", "MPG", "MPE",  "MPEG", "M2T",  "3GP", "3G2",  "QT",  "MOOV", "MOVIE",
+        "AVI", "TXT", "MP2", "MP3", "M4A",  "WAV",  "AIFF", "AIF", "AU",   "AAC", "MID",  "MPA",
+        "GIF", "JPG", "JPEG", "JFIF", "TIF", "TIFF", "PNG", "BMP", "PSD",  "DV"};
+    const auto object = container();
+    ASSERT_EQ(object->GetFileTypeCount(), std::size(extensions));
+    for (ncfUInt32 i = 0; i < std::size(extensions); ++i) {
+        NCFSmartPtr<INCFString> extension, description, group;
+        ASSERT_EQ(object->GetFileType(i, extension.outArg(), description.outArg(), group.outArg()),
+                  NCF_OK);
+        EXPECT_EQ(TextOf(extension.inArg()), extensions[i]);
+        EXPECT_EQ(TextOf(description.inArg()), std::string(extensions[i]) + " Files");
+        EXPECT_EQ(TextOf(group.inArg()), "QuickTime Media Files");
+    }
+    EXPECT_EQ(object->GetFileType(0, nullptr, nullptr, nullptr), NCF_OK);
+    EXPECT_EQ(object->GetFileType(34, nullptr, nullptr, nullptr), NCF_E_NOTFOUND);
+}
+
+// --- path ---------------------------------------------------------------------------
+
+TEST_F(Container, TakesAPathOnceAndLeavesTheCallersStringAlone) {
+    const auto object = container();
+    const auto given = text("C:/a\\b/c.mov");
+    RecordingNMALog log;
+    EXPECT_EQ(object->SetFilePath(given.inArg()), NCF_OK);
+    EXPECT_EQ(TextOf(given.inArg()), "C:/a\\b/c.mov");
+    ASSERT_EQ(log.lines().size(), 1u);
+    EXPECT_EQ(log.lines()[0].level, 8u);
+    EXPECT_EQ(log.lines()[0].text, "Container File Path = C:\\a\\b\\c.mov");
+    EXPECT_EQ(object->SetFilePath(given.inArg()), NMA_E_ALREADYSET);
+}
+
+TEST_F(Container, TakesAnotherPathAfterAnEmptyOne) {
+    const auto object = container();
+    EXPECT_EQ(object->SetFilePath(text("").inArg()), NCF_OK);
+    EXPECT_EQ(object->SetFilePath(text("a.mov").inArg()), NCF_OK);
+}
+
+TEST_F(Container, RefusesANullPath) {
+    EXPECT_EQ(container()->SetFilePath(nullptr), NCF_E_POINTER);
+}
+
+TEST_F(Container, PathWithAPercentSignIsNoFormat) {
+    RecordingNMALog log;
+    EXPECT_EQ(container()->SetFilePath(text("%s%n.mov").inArg()), NCF_OK);
+    EXPECT_TRUE(log.contains("Container File Path = %s%n.mov"));
+}
+
+// --- description -----------------------------------------------------------------------
+
+TEST_F(Container, NeedsAPathBeforeItIsDescribed) {
+    const auto object = container();
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    EXPECT_EQ(object->GetAAFMasterClips(clips.outArg()), NCF_E_POINTER) << "no path at all";
+    object->SetFilePath(text("").inArg());
+    EXPECT_EQ(object->GetAAFMasterClips(clips.outArg()), NMA_E_NOTINITIALIZED) << "an empty one";
+}
+
+TEST_F(Container, HasNoDescriptionUntilItIsAskedFor) {
+    const auto object = container();
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    ncfQuery(object.inArg(), clips);
+    auto* file = reinterpret_cast<IAAFFile*>(&host);
+    EXPECT_EQ(clips->GetMetadata(0, &file), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(file, nullptr);
+    EXPECT_EQ(clips->GetMetadata(0, nullptr), NCF_OK);
+    EXPECT_EQ(clips->GetMetadata(1, &file), NCF_E_NOTFOUND);
+    EXPECT_EQ(clips->GetMetadata(-1, &file), NCF_E_NOTFOUND);
+}
+
+TEST_F(Container, GivesTheFailureOfALoadAndDoesNotTryAgain) {
+    const auto object = container();
+    object->SetFilePath(path(write("a.mov", "no movie")).inArg());
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    EXPECT_EQ(object->GetAAFMasterClips(clips.outArg()), NMA_E_NOTINITIALIZED);
+    EXPECT_TRUE(clips.isNull());
+    const int tries = host.creations(NCFCompID_QTParser);
+    EXPECT_LT(object->GetAAFMasterClips(clips.outArg()), 0);
+    EXPECT_EQ(host.creations(NCFCompID_QTParser), tries) << "the failed clip is kept";
+}
+
+TEST_F(Container, GivesTheCodeOfAFileThatCanNotBeOpened) {
+    const auto object = container();
+    object->SetFilePath(path(folder / "absent.mov").inArg());
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    EXPECT_EQ(object->GetAAFMasterClips(clips.outArg()), NCF_E_HANDLE);
+}
+
+TEST_F(Container, TellsWhetherItsFileCanBeLoaded) {
+    const auto good = container();
+    good->SetFilePath(path(writeMovie()).inArg());
+    EXPECT_EQ(good->IsContainerSupported(), 1);
+    const auto bad = container();
+    bad->SetFilePath(path(write("b.mov", "no movie")).inArg());
+    EXPECT_EQ(bad->IsContainerSupported(), 0);
+}
+
+TEST_F(Container, LetsTheExceptionOfAFileThatCanNotBeOpenedThrough) {
+    const auto object = container();
+    object->SetFilePath(path(folder / "absent.mov").inArg());
+    try {
+        object->IsContainerSupported();
+        FAIL() << "nothing was thrown";
+    } catch (NCFRESULT thrown) {
+        EXPECT_EQ(thrown, NCF_E_HANDLE);
+    }
+}
+
+TEST_F(Container, IsNotSupportedWithoutAPath) {
+    EXPECT_EQ(container()->IsContainerSupported(), 0);
+}
+
+// --- sample mapping -----------------------------------------------------------------------
+
+TEST_F(Container, HasNoSampleMappingBeforeItsPath) {
+    auto* mapping = reinterpret_cast<ISampleMapping*>(&host);
+    EXPECT_EQ(container()->GetSampleMapping(&mapping), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(mapping, nullptr);
+}
+
+TEST_F(Container, ServesNoSampleMappingYet) {
+    const auto object = container();
+    object->SetFilePath(path(writeMovie()).inArg());
+    auto* mapping = reinterpret_cast<ISampleMapping*>(&host);
+    EXPECT_EQ(object->GetSampleMapping(&mapping), NCF_E_NOTIMPL);
+    EXPECT_EQ(mapping, nullptr);
+}
+
+}  // namespace
