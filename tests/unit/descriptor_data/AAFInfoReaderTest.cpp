@@ -147,6 +147,18 @@ TEST_F(AAFInfoReaderTest, KindsArePreferredInTheirOrder) {
     EXPECT_EQ(kind(3), std::pair(false, true));
 }
 
+TEST_F(AAFInfoReaderTest, TheKindIsThatOfTheEntryFoundAndNotOfOnePassedOver) {
+    Load(Entry("1", "MPEG2Video", Size(1920, 1080)) + Entry("1", "RGBA", Size(1280, 720)) +
+         Entry("1", "CDCI", Size(720, 480)));
+    Reader reader(*this, 720, 480);
+    bool isMPEG2 = true;
+    bool isRGBA = true;
+    EXPECT_EQ(reader.IsDescriptorMPEG2(&isMPEG2), NCF_OK);
+    EXPECT_EQ(reader.IsDescriptorRGBA(&isRGBA), NCF_OK);
+    EXPECT_FALSE(isMPEG2);
+    EXPECT_FALSE(isRGBA);
+}
+
 TEST_F(AAFInfoReaderTest, EveryQuestionLogsAFailedSearch) {
     Load(Entry("1", "CDCI", Size(720, 480)));
     Reader reader(*this, 720, 480, 9);
