@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <limits>
 
+#include "reference_host/header_parser/Marks.h"
+
 namespace header_parser {
 
 namespace {
@@ -129,9 +131,10 @@ ChunkMap::Place ChunkMap::PlaceIn(ncfUInt32 run, ncfUInt32 firstSampleOfRun,
 }
 
 ChunkMap::Place ChunkMap::PlaceOfSample(ncfUInt32 sample) const {
-    const auto mark = std::upper_bound(marks_.begin(), marks_.end(), sample) - 1;
-    auto run = static_cast<ncfUInt32>(mark - marks_.begin()) * kStep;
-    ncfUInt32 first = *mark;
+    const auto marks = static_cast<ncfUInt32>(marks_.size());
+    const ncfUInt32 mark = LastNotAbove(marks, sample, [&](ncfUInt32 i) { return marks_[i]; });
+    ncfUInt32 run = mark * kStep;
+    ncfUInt32 first = marks_[mark];
     for (;; ++run) {
         const ncfUInt64 held = ncfUInt64{EndChunk(run) - FirstChunk(run)} * SamplesPerChunk(run);
         if (sample - first < held) {
@@ -142,12 +145,8 @@ ChunkMap::Place ChunkMap::PlaceOfSample(ncfUInt32 sample) const {
 }
 
 ChunkMap::Place ChunkMap::PlaceOfChunk(ncfUInt32 chunk) const {
-    ncfUInt32 low = 0;
-    ncfUInt32 high = runCount_;
-    while (high - low > 1) {
-        const ncfUInt32 middle = low + (high - low) / 2;
-        (FirstChunk(middle) <= chunk ? low : high) = middle;
-    }
+    const ncfUInt32 low =
+        LastNotAbove(runCount_, chunk, [&](ncfUInt32 run) { return FirstChunk(run); });
     ncfUInt32 run = low / kStep * kStep;
     ncfUInt32 first = marks_[low / kStep];
     for (; run < low; ++run) {

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/SampleTable.h"
 
+#include "reference_host/header_parser/Marks.h"
+
 namespace header_parser {
 
 Verdict SampleTable::Read(const SampleTableAtoms& atoms, const PacketLayout& oldSound,
@@ -54,17 +56,8 @@ Verdict SampleTable::NumberList::Read(const Atom& atom, ncfUInt32 sampleCount) {
 }
 
 bool SampleTable::NumberList::Holds(ncfUInt32 number) const {
-    ncfUInt32 low = 0;
-    ncfUInt32 high = count;
-    while (low < high) {
-        const ncfUInt32 middle = low + (high - low) / 2;
-        const ncfUInt32 found = LoadU32(numbers + ncfUInt64{4} * middle);
-        if (found == number) {
-            return true;
-        }
-        found < number ? low = middle + 1 : high = middle;
-    }
-    return false;
+    const auto at = [&](ncfUInt32 i) { return LoadU32(numbers + ncfUInt64{4} * i); };
+    return count != 0 && number >= at(0) && at(LastNotAbove(count, number, at)) == number;
 }
 
 ncfUInt64 SampleTable::PositionOf(ncfUInt32 sample) const {

@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <limits>
 
+#include "reference_host/header_parser/Marks.h"
+
 namespace header_parser {
 
 namespace {
@@ -110,13 +112,10 @@ void SampleTimes::MeasureDisplay() {
 }
 
 SampleTimes::DurationRun SampleTimes::DurationRunOf(ncfUInt32 sample) const {
-    const auto mark = std::upper_bound(durationMarks_.begin(), durationMarks_.end(), sample,
-                                       [](ncfUInt32 wanted, const DurationMark& m) {
-                                           return wanted < m.sample;
-                                       }) -
-                      1;
-    DurationRun run{static_cast<ncfUInt32>(mark - durationMarks_.begin()) * kStep, mark->sample,
-                    mark->time};
+    const auto marks = static_cast<ncfUInt32>(durationMarks_.size());
+    const ncfUInt32 mark =
+        LastNotAbove(marks, sample, [&](ncfUInt32 i) { return durationMarks_[i].sample; });
+    DurationRun run{mark * kStep, durationMarks_[mark].sample, durationMarks_[mark].time};
     while (sample - run.first >= DurationCount(run.entry)) {
         run.first += DurationCount(run.entry);
         run.decodeTime += ncfUInt64{DurationCount(run.entry)} * Duration(run.entry);
@@ -126,8 +125,10 @@ SampleTimes::DurationRun SampleTimes::DurationRunOf(ncfUInt32 sample) const {
 }
 
 SampleTimes::OffsetRun SampleTimes::OffsetRunOf(ncfUInt32 sample) const {
-    const auto mark = std::upper_bound(offsetMarks_.begin(), offsetMarks_.end(), sample) - 1;
-    OffsetRun run{static_cast<ncfUInt32>(mark - offsetMarks_.begin()) * kStep, *mark};
+    const auto marks = static_cast<ncfUInt32>(offsetMarks_.size());
+    const ncfUInt32 mark =
+        LastNotAbove(marks, sample, [&](ncfUInt32 i) { return offsetMarks_[i]; });
+    OffsetRun run{mark * kStep, offsetMarks_[mark]};
     while (sample - run.first >= OffsetCount(run.entry)) {
         run.first += OffsetCount(run.entry);
         ++run.entry;
@@ -174,13 +175,12 @@ void SampleTimes::ForEachStretch(ncfUInt32 sample, Visit visit) const {
 
 // The last sample whose decode time is not behind `time`.
 ncfUInt32 SampleTimes::SampleDecodedAt(ncfUInt64 time) const {
-    const auto mark =
-        std::upper_bound(durationMarks_.begin(), durationMarks_.end(), time,
-                         [](ncfUInt64 wanted, const DurationMark& m) { return wanted < m.time; }) -
-        1;
-    auto entry = static_cast<ncfUInt32>(mark - durationMarks_.begin()) * kStep;
-    ncfUInt64 start = mark->time;
-    ncfUInt32 first = mark->sample;
+    const auto marks = static_cast<ncfUInt32>(durationMarks_.size());
+    const ncfUInt32 mark =
+        LastNotAbove(marks, time, [&](ncfUInt32 i) { return durationMarks_[i].time; });
+    ncfUInt32 entry = mark * kStep;
+    ncfUInt64 start = durationMarks_[mark].time;
+    ncfUInt32 first = durationMarks_[mark].sample;
     ncfUInt32 found = first;
     for (; entry < durationEntries_ && start <= time; ++entry) {
         const ncfUInt32 count = DurationCount(entry);

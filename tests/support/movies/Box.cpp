@@ -120,8 +120,9 @@ Bytes Box::ToBytes() const {
 Bytes Box::HeaderBytes(std::uint64_t payloadSize) const {
     const std::uint64_t size = lies_ ? claimedSize_ : payloadSize + HeaderSize();
     Bytes bytes;
+    bytes.reserve(16);
     Append(bytes, toEnd_ ? 0 : large_ ? 1 : size, 4);
-    bytes.insert(bytes.end(), type_.begin(), type_.end());
+    Append(bytes, movies::Code(type_), 4);
     if (large_) {
         Append(bytes, size, 8);
     }

@@ -355,7 +355,7 @@ std::vector<BrokenMovie> WholeMovies() {
     format.nclc = {{1, 1, 1}};
     format.pixelAspect = {{10, 11}};
     format.cleanAperture = {{704, 1, 480, 1, 0, 1, 0, 1}};
-    format.rasterText = "<Bounds></Bounds>";
+    format.rasterText.emplace("<Bounds></Bounds>");
     format.alphaCodings = {{0, 1}};
     format.resolutionId = 10950;
     track.descriptions = {format.ToBox(), movies::VideoFormat().ToBox()};
