@@ -183,9 +183,10 @@ TEST_F(AttributeTexts, AnyOtherExceptionIsUnexpected) {
 // --- boxes ----------------------------------------------------------------------
 
 TEST_F(AttributeTexts, ReadEachBoxByItsKind) {
-    const std::pair<QTBoxKind, const char*> kinds[] = {
-        {kBoxFraming, "Framing"}, {kBoxValid, "Valid"}, {kBoxEssence, "Essence"},
-        {kBoxSource, "Source"}};
+    const std::pair<QTBoxKind, const char*> kinds[] = {{kBoxFraming, "Framing"},
+                                                       {kBoxValid, "Valid"},
+                                                       {kBoxEssence, "Essence"},
+                                                       {kBoxSource, "Source"}};
     for (const auto& [kind, tag] : kinds) {
         QTAttributesXMLParser parser = parse("<Bounds>" + Box(tag) + "</Bounds>");
         ASSERT_EQ(result, NCF_OK);
@@ -261,8 +262,8 @@ TEST_F(AttributeTexts, MissingNumeratorAndDenominatorAreLoggedUnderOneText) {
                         "_GetNumerator(positionXNode,&op_box->positionX.numerator) : "
                         "ParseHelperFunctions::QTAttributesXMLParser::GetBox"),
               1);
-    QTAttributesXMLParser second = parse(
-        "<Bounds><Valid><PositionX><Numerator>5</Numerator></PositionX></Valid></Bounds>");
+    QTAttributesXMLParser second =
+        parse("<Bounds><Valid><PositionX><Numerator>5</Numerator></PositionX></Valid></Bounds>");
     EXPECT_EQ(second.GetBox(kBoxValid, &box), NCF_E_FAIL);
     EXPECT_EQ(box.positionX.numerator, 5);
     EXPECT_EQ(log.count("NCFASSERT( numeratorElement )"
@@ -318,10 +319,10 @@ TEST_F(AttributeTexts, EveryNumberIsLoggedUnderItsOwnExpression) {
 
 TEST_F(AttributeTexts, HugeNumbersDoNotOverflow) {
     BoundsBox box;
-    QTAttributesXMLParser parser = parse(
-        "<Bounds><Valid>" + Number("PositionX", "99999999999999999999999", "1") +
-        Number("PositionY", "1", "1") + Number("Height", "1", "1") + Number("Width", "1", "1") +
-        "</Valid></Bounds>");
+    QTAttributesXMLParser parser =
+        parse("<Bounds><Valid>" + Number("PositionX", "99999999999999999999999", "1") +
+              Number("PositionY", "1", "1") + Number("Height", "1", "1") +
+              Number("Width", "1", "1") + "</Valid></Bounds>");
     EXPECT_EQ(parser.GetBox(kBoxValid, &box), NCF_OK);
 }
 
