@@ -47,14 +47,14 @@ constexpr const GUID& aafIdOf(const IAAFSegment*) {
 
 // Answered by AAFComponent.
 struct IAAFComponent : IUnknown {
-    virtual HRESULT SetLength(aafLength_constref length) = 0;  // 3
-    virtual HRESULT GetLength(aafLength_t* length) = 0;  // 4
-    virtual HRESULT SetDataDef(IAAFDataDef* dataDef) = 0;  // 5
-    virtual HRESULT GetDataDef(IAAFDataDef** datadef) = 0;  // 6
-    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;  // 7
-    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;  // 8
+    virtual HRESULT SetLength(aafLength_constref length) = 0;      // 3
+    virtual HRESULT GetLength(aafLength_t* length) = 0;            // 4
+    virtual HRESULT SetDataDef(IAAFDataDef* dataDef) = 0;          // 5
+    virtual HRESULT GetDataDef(IAAFDataDef** datadef) = 0;         // 6
+    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;          // 7
+    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;          // 8
     virtual HRESULT GetKLVData(IEnumAAFKLVData** enumerator) = 0;  // 9
-    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;  // 10
+    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;          // 10
 
 protected:
     ~IAAFComponent() = default;
@@ -67,24 +67,24 @@ constexpr const GUID& aafIdOf(const IAAFComponent*) {
 
 // Answered by AAFComponent.
 struct IAAFComponent2 : IUnknown {
-    virtual HRESULT SetLength(aafLength_constref length) = 0;  // 3
-    virtual HRESULT GetLength(aafLength_t* length) = 0;  // 4
-    virtual HRESULT SetDataDef(IAAFDataDef* dataDef) = 0;  // 5
-    virtual HRESULT GetDataDef(IAAFDataDef** datadef) = 0;  // 6
-    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;  // 7
-    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;  // 8
+    virtual HRESULT SetLength(aafLength_constref length) = 0;      // 3
+    virtual HRESULT GetLength(aafLength_t* length) = 0;            // 4
+    virtual HRESULT SetDataDef(IAAFDataDef* dataDef) = 0;          // 5
+    virtual HRESULT GetDataDef(IAAFDataDef** datadef) = 0;         // 6
+    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;          // 7
+    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;          // 8
     virtual HRESULT GetKLVData(IEnumAAFKLVData** enumerator) = 0;  // 9
-    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;  // 10
+    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;          // 10
     virtual HRESULT AppendComment(aafCharacter_constptr name,
-                                  aafCharacter_constptr value) = 0;  // 11
-    virtual HRESULT CountComments(aafUInt32* numComments) = 0;  // 12
+                                  aafCharacter_constptr value) = 0;      // 11
+    virtual HRESULT CountComments(aafUInt32* numComments) = 0;           // 12
     virtual HRESULT GetComments(IEnumAAFTaggedValues** enumerator) = 0;  // 13
-    virtual HRESULT RemoveComment(IAAFTaggedValue* comment) = 0;  // 14
+    virtual HRESULT RemoveComment(IAAFTaggedValue* comment) = 0;         // 14
     virtual HRESULT AppendAttribute(aafCharacter_constptr name,
-                                    aafCharacter_constptr value) = 0;  // 15
-    virtual HRESULT CountAttributes(aafUInt32* numAttributes) = 0;  // 16
+                                    aafCharacter_constptr value) = 0;      // 15
+    virtual HRESULT CountAttributes(aafUInt32* numAttributes) = 0;         // 16
     virtual HRESULT GetAttributes(IEnumAAFTaggedValues** enumerator) = 0;  // 17
-    virtual HRESULT RemoveAttribute(IAAFTaggedValue* attribute) = 0;  // 18
+    virtual HRESULT RemoveAttribute(IAAFTaggedValue* attribute) = 0;       // 18
 
 protected:
     ~IAAFComponent2() = default;
@@ -97,14 +97,14 @@ constexpr const GUID& aafIdOf(const IAAFComponent2*) {
 
 // Answered by AAFSequence.
 struct IAAFSequence : IUnknown {
-    virtual HRESULT Initialize(IAAFDataDef* dataDef) = 0;  // 3
-    virtual HRESULT AppendComponent(IAAFComponent* component) = 0;  // 4
-    virtual HRESULT PrependComponent(IAAFComponent* component) = 0;  // 5
+    virtual HRESULT Initialize(IAAFDataDef* dataDef) = 0;                              // 3
+    virtual HRESULT AppendComponent(IAAFComponent* component) = 0;                     // 4
+    virtual HRESULT PrependComponent(IAAFComponent* component) = 0;                    // 5
     virtual HRESULT InsertComponentAt(aafUInt32 index, IAAFComponent* component) = 0;  // 6
-    virtual HRESULT GetComponentAt(aafUInt32 index, IAAFComponent** component) = 0;  // 7
-    virtual HRESULT RemoveComponentAt(aafUInt32 index) = 0;  // 8
-    virtual HRESULT CountComponents(aafUInt32* result) = 0;  // 9
-    virtual HRESULT GetComponents(IEnumAAFComponents** enumerator) = 0;  // 10
+    virtual HRESULT GetComponentAt(aafUInt32 index, IAAFComponent** component) = 0;    // 7
+    virtual HRESULT RemoveComponentAt(aafUInt32 index) = 0;                            // 8
+    virtual HRESULT CountComponents(aafUInt32* result) = 0;                            // 9
+    virtual HRESULT GetComponents(IEnumAAFComponents** enumerator) = 0;                // 10
 
 protected:
     ~IAAFSequence() = default;
@@ -119,9 +119,9 @@ constexpr const GUID& aafIdOf(const IAAFSequence*) {
 struct IEnumAAFComponents : IUnknown {
     virtual HRESULT NextOne(IAAFComponent** component) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFComponent** components,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;             // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                   // 5
+    virtual HRESULT Reset() = 0;                                 // 6
     virtual HRESULT Clone(IEnumAAFComponents** enumerator) = 0;  // 7
 
 protected:
@@ -135,10 +135,10 @@ constexpr const GUID& aafIdOf(const IEnumAAFComponents*) {
 
 // Answered by AAFSourceReference.
 struct IAAFSourceReference : IUnknown {
-    virtual HRESULT GetSourceID(aafMobID_t* sourceID) = 0;  // 3
-    virtual HRESULT SetSourceID(aafMobID_constref sourceID) = 0;  // 4
+    virtual HRESULT GetSourceID(aafMobID_t* sourceID) = 0;           // 3
+    virtual HRESULT SetSourceID(aafMobID_constref sourceID) = 0;     // 4
     virtual HRESULT GetSourceMobSlotID(aafSlotID_t* mobSlotID) = 0;  // 5
-    virtual HRESULT SetSourceMobSlotID(aafSlotID_t mobSlotID) = 0;  // 6
+    virtual HRESULT SetSourceMobSlotID(aafSlotID_t mobSlotID) = 0;   // 6
 
 protected:
     ~IAAFSourceReference() = default;
@@ -151,18 +151,18 @@ constexpr const GUID& aafIdOf(const IAAFSourceReference*) {
 
 // Answered by AAFSourceReference.
 struct IAAFSourceReference2 : IUnknown {
-    virtual HRESULT GetSourceID(aafMobID_t* sourceID) = 0;  // 3
-    virtual HRESULT SetSourceID(aafMobID_constref sourceID) = 0;  // 4
-    virtual HRESULT GetSourceMobSlotID(aafSlotID_t* mobSlotID) = 0;  // 5
-    virtual HRESULT SetSourceMobSlotID(aafSlotID_t mobSlotID) = 0;  // 6
+    virtual HRESULT GetSourceID(aafMobID_t* sourceID) = 0;                               // 3
+    virtual HRESULT SetSourceID(aafMobID_constref sourceID) = 0;                         // 4
+    virtual HRESULT GetSourceMobSlotID(aafSlotID_t* mobSlotID) = 0;                      // 5
+    virtual HRESULT SetSourceMobSlotID(aafSlotID_t mobSlotID) = 0;                       // 6
     virtual HRESULT SetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) = 0;  // 7
     virtual HRESULT GetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) = 0;  // 8
-    virtual HRESULT GetChannelIDsSize(aafUInt32* size) = 0;  // 9
+    virtual HRESULT GetChannelIDsSize(aafUInt32* size) = 0;                              // 9
     virtual HRESULT SetMonoSourceSlotIDs(aafUInt32 numberElements,
                                          aafUInt32* monoSourceSlotIDs) = 0;  // 10
     virtual HRESULT GetMonoSourceSlotIDs(aafUInt32 numberElements,
                                          aafUInt32* monoSourceSlotIDs) = 0;  // 11
-    virtual HRESULT GetMonoSourceSlotIDsSize(aafUInt32* size) = 0;  // 12
+    virtual HRESULT GetMonoSourceSlotIDsSize(aafUInt32* size) = 0;           // 12
 
 protected:
     ~IAAFSourceReference2() = default;
@@ -180,10 +180,10 @@ struct IAAFSourceClip : IUnknown {
     virtual HRESULT GetFade(aafLength_t* fadeInLen, aafFadeType_t* fadeInType,
                             aafBoolean_t* fadeInPresent, aafLength_t* fadeOutLen,
                             aafFadeType_t* fadeOutType, aafBoolean_t* fadeOutPresent) = 0;  // 4
-    virtual HRESULT ResolveRef(IAAFMob** mob) = 0;  // 5
-    virtual HRESULT GetSourceReference(aafSourceRef_t* sourceRef) = 0;  // 6
+    virtual HRESULT ResolveRef(IAAFMob** mob) = 0;                                          // 5
+    virtual HRESULT GetSourceReference(aafSourceRef_t* sourceRef) = 0;                      // 6
     virtual HRESULT SetFade(aafInt32 fadeInLen, aafFadeType_t fadeInType, aafInt32 fadeOutLen,
-                            aafFadeType_t fadeOutType) = 0;  // 7
+                            aafFadeType_t fadeOutType) = 0;            // 7
     virtual HRESULT SetSourceReference(aafSourceRef_t sourceRef) = 0;  // 8
 
 protected:
@@ -198,8 +198,8 @@ constexpr const GUID& aafIdOf(const IAAFSourceClip*) {
 // Answered by AAFTimecode.
 struct IAAFTimecode : IUnknown {
     virtual HRESULT Initialize(aafLength_t length, aafTimecode_t* timecode) = 0;  // 3
-    virtual HRESULT GetTimecode(aafTimecode_t* timecode) = 0;  // 4
-    virtual HRESULT SetTimecode(aafTimecode_t* timecode) = 0;  // 5
+    virtual HRESULT GetTimecode(aafTimecode_t* timecode) = 0;                     // 4
+    virtual HRESULT SetTimecode(aafTimecode_t* timecode) = 0;                     // 5
 
 protected:
     ~IAAFTimecode() = default;
@@ -225,11 +225,11 @@ constexpr const GUID& aafIdOf(const IAAFFiller*) {
 
 // Answered by EnumAAFSegments.
 struct IEnumAAFSegments : IUnknown {
-    virtual HRESULT NextOne(IAAFSegment** segments) = 0;  // 3
+    virtual HRESULT NextOne(IAAFSegment** segments) = 0;                                       // 3
     virtual HRESULT Next(aafUInt32 count, IAAFSegment** segments, aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFSegments** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                 // 5
+    virtual HRESULT Reset() = 0;                                                               // 6
+    virtual HRESULT Clone(IEnumAAFSegments** enumerator) = 0;                                  // 7
 
 protected:
     ~IEnumAAFSegments() = default;
@@ -242,7 +242,7 @@ constexpr const GUID& aafIdOf(const IEnumAAFSegments*) {
 
 // Answered by AAFCommentMarker.
 struct IAAFCommentMarker : IUnknown {
-    virtual HRESULT GetAnnotation(IAAFSourceReference** result) = 0;  // 3
+    virtual HRESULT GetAnnotation(IAAFSourceReference** result) = 0;     // 3
     virtual HRESULT SetAnnotation(IAAFSourceReference* annotation) = 0;  // 4
 
 protected:
@@ -259,9 +259,9 @@ struct IAAFConstantValue : IUnknown {
     virtual HRESULT Initialize(IAAFParameterDef* parameterDef, aafUInt32 valueSize,
                                aafDataBuffer_t value) = 0;  // 3
     virtual HRESULT GetValue(aafUInt32 valueSize, aafDataBuffer_t value,
-                             aafUInt32* bytesRead) = 0;  // 4
-    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;  // 5
-    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;  // 6
+                             aafUInt32* bytesRead) = 0;                        // 4
+    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;                        // 5
+    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;              // 6
     virtual HRESULT SetValue(aafUInt32 valueSize, aafDataBuffer_t value) = 0;  // 7
 
 protected:
@@ -277,14 +277,14 @@ constexpr const GUID& aafIdOf(const IAAFConstantValue*) {
 struct IAAFControlPoint : IUnknown {
     virtual HRESULT Initialize(IAAFVaryingValue* varyingValue, aafRational_constref time,
                                aafUInt32 valueSize, aafDataBuffer_t value) = 0;  // 3
-    virtual HRESULT GetTime(aafRational_t* time) = 0;  // 4
-    virtual HRESULT GetEditHint(aafEditHint_t* editHint) = 0;  // 5
-    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;  // 6
+    virtual HRESULT GetTime(aafRational_t* time) = 0;                            // 4
+    virtual HRESULT GetEditHint(aafEditHint_t* editHint) = 0;                    // 5
+    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;                          // 6
     virtual HRESULT GetValue(aafUInt32 valueSize, aafDataBuffer_t value,
-                             aafUInt32* bytesRead) = 0;  // 7
-    virtual HRESULT SetTime(aafRational_t time) = 0;  // 8
-    virtual HRESULT SetEditHint(aafEditHint_t editHint) = 0;  // 9
-    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;  // 10
+                             aafUInt32* bytesRead) = 0;                        // 7
+    virtual HRESULT SetTime(aafRational_t time) = 0;                           // 8
+    virtual HRESULT SetEditHint(aafEditHint_t editHint) = 0;                   // 9
+    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;              // 10
     virtual HRESULT SetValue(aafUInt32 valueSize, aafDataBuffer_t value) = 0;  // 11
 
 protected:
@@ -299,14 +299,14 @@ constexpr const GUID& aafIdOf(const IAAFControlPoint*) {
 // Answered by AAFDescriptiveClip.
 struct IAAFDescriptiveClip : IUnknown {
     virtual HRESULT Initialize(IAAFDataDef* dataDef, aafLength_constref length,
-                               aafSourceRef_t sourceRef) = 0;  // 3
+                               aafSourceRef_t sourceRef) = 0;     // 3
     virtual HRESULT CountDescribedSlotIDs(aafUInt32* count) = 0;  // 4
     virtual HRESULT GetDescribedSlotIDs(aafUInt32 maxDescribedSlotIDCount,
                                         aafUInt32* describedSlotIDs) = 0;  // 5
     virtual HRESULT IsDescribedSlotIDPresent(aafUInt32 describedSlotID,
                                              aafBoolean_t* isPresent) = 0;  // 6
-    virtual HRESULT AddDescribedSlotID(aafUInt32 describedSlotID) = 0;  // 7
-    virtual HRESULT RemoveDescribedSlotID(aafUInt32 describedSlotID) = 0;  // 8
+    virtual HRESULT AddDescribedSlotID(aafUInt32 describedSlotID) = 0;      // 7
+    virtual HRESULT RemoveDescribedSlotID(aafUInt32 describedSlotID) = 0;   // 8
 
 protected:
     ~IAAFDescriptiveClip() = default;
@@ -323,10 +323,12 @@ struct IAAFDescriptiveMarker : IUnknown {
     virtual HRESULT SetDescribedSlotIDs(aafUInt32 numberElements,
                                         aafUInt32* describedSlotIDs) = 0;  // 4
     virtual HRESULT GetDescribedSlotIDs(aafUInt32 numberElements,
-                                        aafUInt32* describedSlotIDs) = 0;  // 5
+                                        aafUInt32* describedSlotIDs) = 0;    // 5
     virtual HRESULT GetDescribedSlotIDsSize(aafUInt32* numberElements) = 0;  // 6
-    virtual HRESULT SetDescriptiveFramework(IAAFDescriptiveFramework* descriptiveFramework) = 0;  // 7
-    virtual HRESULT GetDescriptiveFramework(IAAFDescriptiveFramework** descriptiveFramework) = 0;  // 8
+    virtual HRESULT SetDescriptiveFramework(
+        IAAFDescriptiveFramework* descriptiveFramework) = 0;  // 7
+    virtual HRESULT GetDescriptiveFramework(
+        IAAFDescriptiveFramework** descriptiveFramework) = 0;  // 8
 
 protected:
     ~IAAFDescriptiveMarker() = default;
@@ -340,7 +342,7 @@ constexpr const GUID& aafIdOf(const IAAFDescriptiveMarker*) {
 // Answered by AAFEdgecode.
 struct IAAFEdgecode : IUnknown {
     virtual HRESULT Initialize(aafLength_t length, aafEdgecode_t edgecode) = 0;  // 3
-    virtual HRESULT GetEdgecode(aafEdgecode_t* edgecode) = 0;  // 4
+    virtual HRESULT GetEdgecode(aafEdgecode_t* edgecode) = 0;                    // 4
 
 protected:
     ~IAAFEdgecode() = default;
@@ -353,14 +355,14 @@ constexpr const GUID& aafIdOf(const IAAFEdgecode*) {
 
 // Answered by AAFEssenceGroup.
 struct IAAFEssenceGroup : IUnknown {
-    virtual HRESULT SetStillFrame(IAAFSourceClip* stillFrame) = 0;  // 3
-    virtual HRESULT GetStillFrame(IAAFSourceClip** stillFrame) = 0;  // 4
-    virtual HRESULT AppendChoice(IAAFSegment* choice) = 0;  // 5
-    virtual HRESULT PrependChoice(IAAFSegment* choice) = 0;  // 6
+    virtual HRESULT SetStillFrame(IAAFSourceClip* stillFrame) = 0;             // 3
+    virtual HRESULT GetStillFrame(IAAFSourceClip** stillFrame) = 0;            // 4
+    virtual HRESULT AppendChoice(IAAFSegment* choice) = 0;                     // 5
+    virtual HRESULT PrependChoice(IAAFSegment* choice) = 0;                    // 6
     virtual HRESULT InsertChoiceAt(aafUInt32 index, IAAFSegment* choice) = 0;  // 7
-    virtual HRESULT CountChoices(aafUInt32* count) = 0;  // 8
-    virtual HRESULT GetChoiceAt(aafUInt32 index, IAAFSegment** choice) = 0;  // 9
-    virtual HRESULT RemoveChoiceAt(aafUInt32 index) = 0;  // 10
+    virtual HRESULT CountChoices(aafUInt32* count) = 0;                        // 8
+    virtual HRESULT GetChoiceAt(aafUInt32 index, IAAFSegment** choice) = 0;    // 9
+    virtual HRESULT RemoveChoiceAt(aafUInt32 index) = 0;                       // 10
 
 protected:
     ~IAAFEssenceGroup() = default;
@@ -373,11 +375,11 @@ constexpr const GUID& aafIdOf(const IAAFEssenceGroup*) {
 
 // Answered by AAFEvent.
 struct IAAFEvent : IUnknown {
-    virtual HRESULT GetPosition(aafPosition_t* position) = 0;  // 3
-    virtual HRESULT SetPosition(aafPosition_t position) = 0;  // 4
-    virtual HRESULT SetComment(aafCharacter_constptr comment) = 0;  // 5
+    virtual HRESULT GetPosition(aafPosition_t* position) = 0;                  // 3
+    virtual HRESULT SetPosition(aafPosition_t position) = 0;                   // 4
+    virtual HRESULT SetComment(aafCharacter_constptr comment) = 0;             // 5
     virtual HRESULT GetComment(aafCharacter* comment, aafUInt32 bufSize) = 0;  // 6
-    virtual HRESULT GetCommentBufLen(aafUInt32* bufSize) = 0;  // 7
+    virtual HRESULT GetCommentBufLen(aafUInt32* bufSize) = 0;                  // 7
 
 protected:
     ~IAAFEvent() = default;
@@ -391,7 +393,7 @@ constexpr const GUID& aafIdOf(const IAAFEvent*) {
 // Answered by AAFGPITrigger.
 struct IAAFGPITrigger : IUnknown {
     virtual HRESULT GetActiveState(aafBoolean_t* activeState) = 0;  // 3
-    virtual HRESULT SetActiveState(aafBoolean_t activeState) = 0;  // 4
+    virtual HRESULT SetActiveState(aafBoolean_t activeState) = 0;   // 4
 
 protected:
     ~IAAFGPITrigger() = default;
@@ -404,13 +406,13 @@ constexpr const GUID& aafIdOf(const IAAFGPITrigger*) {
 
 // Answered by AAFNestedScope.
 struct IAAFNestedScope : IUnknown {
-    virtual HRESULT AppendSegment(IAAFSegment* segment) = 0;  // 3
-    virtual HRESULT PrependSegment(IAAFSegment* segment) = 0;  // 4
+    virtual HRESULT AppendSegment(IAAFSegment* segment) = 0;                     // 3
+    virtual HRESULT PrependSegment(IAAFSegment* segment) = 0;                    // 4
     virtual HRESULT InsertSegmentAt(aafUInt32 index, IAAFSegment* segment) = 0;  // 5
-    virtual HRESULT RemoveSegmentAt(aafUInt32 index) = 0;  // 6
-    virtual HRESULT CountSegments(aafUInt32* result) = 0;  // 7
-    virtual HRESULT GetSegmentAt(aafUInt32 index, IAAFSegment** segment) = 0;  // 8
-    virtual HRESULT GetSegments(IEnumAAFSegments** enumerator) = 0;  // 9
+    virtual HRESULT RemoveSegmentAt(aafUInt32 index) = 0;                        // 6
+    virtual HRESULT CountSegments(aafUInt32* result) = 0;                        // 7
+    virtual HRESULT GetSegmentAt(aafUInt32 index, IAAFSegment** segment) = 0;    // 8
+    virtual HRESULT GetSegments(IEnumAAFSegments** enumerator) = 0;              // 9
 
 protected:
     ~IAAFNestedScope() = default;
@@ -424,26 +426,26 @@ constexpr const GUID& aafIdOf(const IAAFNestedScope*) {
 // Answered by AAFOperationGroup.
 struct IAAFOperationGroup : IUnknown {
     virtual HRESULT Initialize(IAAFDataDef* dataDef, aafLength_t length,
-                               IAAFOperationDef* operationDef) = 0;  // 3
-    virtual HRESULT GetOperationDefinition(IAAFOperationDef** operationDef) = 0;  // 4
-    virtual HRESULT SetOperationDefinition(IAAFOperationDef* operationDef) = 0;  // 5
-    virtual HRESULT GetRender(IAAFSourceReference** sourceRef) = 0;  // 6
-    virtual HRESULT IsATimeWarp(aafBoolean_t* isTimeWarp) = 0;  // 7
-    virtual HRESULT GetBypassOverride(aafUInt32* bypassOverride) = 0;  // 8
-    virtual HRESULT CountSourceSegments(aafUInt32* result) = 0;  // 9
-    virtual HRESULT IsValidTranOperation(aafBoolean_t* validTransition) = 0;  // 10
-    virtual HRESULT CountParameters(aafUInt32* result) = 0;  // 11
-    virtual HRESULT AddParameter(IAAFParameter* parameter) = 0;  // 12
-    virtual HRESULT AppendInputSegment(IAAFSegment* segment) = 0;  // 13
-    virtual HRESULT PrependInputSegment(IAAFSegment* segment) = 0;  // 14
+                               IAAFOperationDef* operationDef) = 0;                   // 3
+    virtual HRESULT GetOperationDefinition(IAAFOperationDef** operationDef) = 0;      // 4
+    virtual HRESULT SetOperationDefinition(IAAFOperationDef* operationDef) = 0;       // 5
+    virtual HRESULT GetRender(IAAFSourceReference** sourceRef) = 0;                   // 6
+    virtual HRESULT IsATimeWarp(aafBoolean_t* isTimeWarp) = 0;                        // 7
+    virtual HRESULT GetBypassOverride(aafUInt32* bypassOverride) = 0;                 // 8
+    virtual HRESULT CountSourceSegments(aafUInt32* result) = 0;                       // 9
+    virtual HRESULT IsValidTranOperation(aafBoolean_t* validTransition) = 0;          // 10
+    virtual HRESULT CountParameters(aafUInt32* result) = 0;                           // 11
+    virtual HRESULT AddParameter(IAAFParameter* parameter) = 0;                       // 12
+    virtual HRESULT AppendInputSegment(IAAFSegment* segment) = 0;                     // 13
+    virtual HRESULT PrependInputSegment(IAAFSegment* segment) = 0;                    // 14
     virtual HRESULT InsertInputSegmentAt(aafUInt32 index, IAAFSegment* segment) = 0;  // 15
-    virtual HRESULT SetRender(IAAFSourceReference* sourceRef) = 0;  // 16
-    virtual HRESULT SetBypassOverride(aafUInt32 bypassOverride) = 0;  // 17
-    virtual HRESULT GetParameters(IEnumAAFParameters** enumerator) = 0;  // 18
+    virtual HRESULT SetRender(IAAFSourceReference* sourceRef) = 0;                    // 16
+    virtual HRESULT SetBypassOverride(aafUInt32 bypassOverride) = 0;                  // 17
+    virtual HRESULT GetParameters(IEnumAAFParameters** enumerator) = 0;               // 18
     virtual HRESULT LookupParameter(aafArgIDType_constref argID,
-                                    IAAFParameter** parameter) = 0;  // 19
+                                    IAAFParameter** parameter) = 0;                      // 19
     virtual HRESULT GetInputSegmentAt(aafUInt32 index, IAAFSegment** inputSegment) = 0;  // 20
-    virtual HRESULT RemoveInputSegmentAt(aafUInt32 index) = 0;  // 21
+    virtual HRESULT RemoveInputSegmentAt(aafUInt32 index) = 0;                           // 21
 
 protected:
     ~IAAFOperationGroup() = default;
@@ -457,7 +459,7 @@ constexpr const GUID& aafIdOf(const IAAFOperationGroup*) {
 // Answered by AAFParameter.
 struct IAAFParameter : IUnknown {
     virtual HRESULT GetParameterDefinition(IAAFParameterDef** parmDef) = 0;  // 3
-    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;  // 4
+    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;            // 4
 
 protected:
     ~IAAFParameter() = default;
@@ -470,14 +472,14 @@ constexpr const GUID& aafIdOf(const IAAFParameter*) {
 
 // Answered by AAFPulldown.
 struct IAAFPulldown : IUnknown {
-    virtual HRESULT GetInputSegment(IAAFSegment** inputSegment) = 0;  // 3
-    virtual HRESULT SetInputSegment(IAAFSegment* inputSegment) = 0;  // 4
-    virtual HRESULT GetPulldownKind(aafPulldownKind_t* pulldownKind) = 0;  // 5
-    virtual HRESULT SetPulldownKind(aafPulldownKind_t pulldownKind) = 0;  // 6
+    virtual HRESULT GetInputSegment(IAAFSegment** inputSegment) = 0;                // 3
+    virtual HRESULT SetInputSegment(IAAFSegment* inputSegment) = 0;                 // 4
+    virtual HRESULT GetPulldownKind(aafPulldownKind_t* pulldownKind) = 0;           // 5
+    virtual HRESULT SetPulldownKind(aafPulldownKind_t pulldownKind) = 0;            // 6
     virtual HRESULT GetPulldownDirection(aafPulldownDir_t* pulldownDirection) = 0;  // 7
-    virtual HRESULT SetPulldownDirection(aafPulldownDir_t pulldownDirection) = 0;  // 8
-    virtual HRESULT GetPhaseFrame(aafPhaseFrame_t* phaseFrame) = 0;  // 9
-    virtual HRESULT SetPhaseFrame(aafPhaseFrame_t phaseFrame) = 0;  // 10
+    virtual HRESULT SetPulldownDirection(aafPulldownDir_t pulldownDirection) = 0;   // 8
+    virtual HRESULT GetPhaseFrame(aafPhaseFrame_t* phaseFrame) = 0;                 // 9
+    virtual HRESULT SetPhaseFrame(aafPhaseFrame_t phaseFrame) = 0;                  // 10
 
 protected:
     ~IAAFPulldown() = default;
@@ -492,9 +494,9 @@ constexpr const GUID& aafIdOf(const IAAFPulldown*) {
 struct IAAFScopeReference : IUnknown {
     virtual HRESULT Create(aafUInt32 relativeScope, aafUInt32 relativeSlot) = 0;  // 3
     virtual HRESULT Initialize(IAAFDataDef* dataDef, aafUInt32 relativeScope,
-                               aafUInt32 relativeSlot) = 0;  // 4
+                               aafUInt32 relativeSlot) = 0;            // 4
     virtual HRESULT GetRelativeScope(aafUInt32* pnRelativeScope) = 0;  // 5
-    virtual HRESULT GetRelativeSlot(aafUInt32* pnRelativeSlot) = 0;  // 6
+    virtual HRESULT GetRelativeSlot(aafUInt32* pnRelativeSlot) = 0;    // 6
 
 protected:
     ~IAAFScopeReference() = default;
@@ -507,12 +509,12 @@ constexpr const GUID& aafIdOf(const IAAFScopeReference*) {
 
 // Answered by AAFSelector.
 struct IAAFSelector : IUnknown {
-    virtual HRESULT GetSelectedSegment(IAAFSegment** selSegment) = 0;  // 3
-    virtual HRESULT SetSelectedSegment(IAAFSegment* selSegment) = 0;  // 4
-    virtual HRESULT AppendAlternateSegment(IAAFSegment* segment) = 0;  // 5
-    virtual HRESULT GetNumAlternateSegments(aafInt32* numSegments) = 0;  // 6
+    virtual HRESULT GetSelectedSegment(IAAFSegment** selSegment) = 0;          // 3
+    virtual HRESULT SetSelectedSegment(IAAFSegment* selSegment) = 0;           // 4
+    virtual HRESULT AppendAlternateSegment(IAAFSegment* segment) = 0;          // 5
+    virtual HRESULT GetNumAlternateSegments(aafInt32* numSegments) = 0;        // 6
     virtual HRESULT EnumAlternateSegments(IEnumAAFSegments** enumerator) = 0;  // 7
-    virtual HRESULT RemoveAlternateSegment(IAAFSegment* segment) = 0;  // 8
+    virtual HRESULT RemoveAlternateSegment(IAAFSegment* segment) = 0;          // 8
 
 protected:
     ~IAAFSelector() = default;
@@ -526,20 +528,20 @@ constexpr const GUID& aafIdOf(const IAAFSelector*) {
 // Answered by AAFTimecodeStream.
 struct IAAFTimecodeStream : IUnknown {
     virtual HRESULT GetPositionTimecode(aafPosition_t position, aafTimecode_t* timecode) = 0;  // 3
-    virtual HRESULT SetPositionTimecode(aafPosition_t position, aafTimecode_t timecode) = 0;  // 4
-    virtual HRESULT GetUserDataLength(aafInt32* length) = 0;  // 5
+    virtual HRESULT SetPositionTimecode(aafPosition_t position, aafTimecode_t timecode) = 0;   // 4
+    virtual HRESULT GetUserDataLength(aafInt32* length) = 0;                                   // 5
     virtual HRESULT GetUserDataAtPosition(aafPosition_t position, aafInt32 buflen,
                                           aafDataBuffer_t buffer) = 0;  // 6
     virtual HRESULT SetUserDataAtPosition(aafPosition_t position, aafInt32 buflen,
-                                          aafDataBuffer_t buffer) = 0;  // 7
-    virtual HRESULT SetSampleRate(aafRational_t sampleRate) = 0;  // 8
-    virtual HRESULT GetSampleRate(aafRational_t* sampleRate) = 0;  // 9
-    virtual HRESULT SetSourceType(aafTimecodeSourceType_t sourceType) = 0;  // 10
+                                          aafDataBuffer_t buffer) = 0;       // 7
+    virtual HRESULT SetSampleRate(aafRational_t sampleRate) = 0;             // 8
+    virtual HRESULT GetSampleRate(aafRational_t* sampleRate) = 0;            // 9
+    virtual HRESULT SetSourceType(aafTimecodeSourceType_t sourceType) = 0;   // 10
     virtual HRESULT GetSourceType(aafTimecodeSourceType_t* sourceType) = 0;  // 11
-    virtual HRESULT GetSampleSize(aafUInt32* sampleSize) = 0;  // 12
+    virtual HRESULT GetSampleSize(aafUInt32* sampleSize) = 0;                // 12
     virtual HRESULT GetSource(aafUInt32 valueSize, aafDataBuffer_t value,
-                              aafUInt32* bytesRead) = 0;  // 13
-    virtual HRESULT GetSourceBufLen(aafUInt32* len) = 0;  // 14
+                              aafUInt32* bytesRead) = 0;                        // 13
+    virtual HRESULT GetSourceBufLen(aafUInt32* len) = 0;                        // 14
     virtual HRESULT SetSource(aafUInt32 valueSize, aafDataBuffer_t value) = 0;  // 15
 
 protected:
@@ -565,11 +567,11 @@ constexpr const GUID& aafIdOf(const IAAFTimecodeStream12M*) {
 // Answered by AAFTransition.
 struct IAAFTransition : IUnknown {
     virtual HRESULT Initialize(IAAFDataDef* dataDef, aafLength_t length, aafPosition_t cutPoint,
-                               IAAFOperationGroup* op) = 0;  // 3
-    virtual HRESULT GetCutPoint(aafPosition_t* cutPoint) = 0;  // 4
+                               IAAFOperationGroup* op) = 0;                // 3
+    virtual HRESULT GetCutPoint(aafPosition_t* cutPoint) = 0;              // 4
     virtual HRESULT GetOperationGroup(IAAFOperationGroup** groupObj) = 0;  // 5
-    virtual HRESULT SetCutPoint(aafPosition_t cutPoint) = 0;  // 6
-    virtual HRESULT SetOperationGroup(IAAFOperationGroup* opgroup) = 0;  // 7
+    virtual HRESULT SetCutPoint(aafPosition_t cutPoint) = 0;               // 6
+    virtual HRESULT SetOperationGroup(IAAFOperationGroup* opgroup) = 0;    // 7
 
 protected:
     ~IAAFTransition() = default;
@@ -583,14 +585,14 @@ constexpr const GUID& aafIdOf(const IAAFTransition*) {
 // Answered by AAFVaryingValue.
 struct IAAFVaryingValue : IUnknown {
     virtual HRESULT Initialize(IAAFParameterDef* parameterDef,
-                               IAAFInterpolationDef* interpolation) = 0;  // 3
-    virtual HRESULT AddControlPoint(IAAFControlPoint* controlPoint) = 0;  // 4
-    virtual HRESULT GetControlPoints(IEnumAAFControlPoints** enumerator) = 0;  // 5
-    virtual HRESULT CountControlPoints(aafUInt32* result) = 0;  // 6
+                               IAAFInterpolationDef* interpolation) = 0;                      // 3
+    virtual HRESULT AddControlPoint(IAAFControlPoint* controlPoint) = 0;                      // 4
+    virtual HRESULT GetControlPoints(IEnumAAFControlPoints** enumerator) = 0;                 // 5
+    virtual HRESULT CountControlPoints(aafUInt32* result) = 0;                                // 6
     virtual HRESULT GetControlPointAt(aafUInt32 index, IAAFControlPoint** controlPoint) = 0;  // 7
-    virtual HRESULT RemoveControlPointAt(aafUInt32 index) = 0;  // 8
-    virtual HRESULT GetInterpolationDefinition(IAAFInterpolationDef** interpolation) = 0;  // 9
-    virtual HRESULT GetValueBufLen(aafInt32* len) = 0;  // 10
+    virtual HRESULT RemoveControlPointAt(aafUInt32 index) = 0;                                // 8
+    virtual HRESULT GetInterpolationDefinition(IAAFInterpolationDef** interpolation) = 0;     // 9
+    virtual HRESULT GetValueBufLen(aafInt32* len) = 0;                                        // 10
     virtual HRESULT GetInterpolatedValue(aafRational_t inputValue, aafInt32 valueSize,
                                          aafDataBuffer_t value, aafInt32* bytesRead) = 0;  // 11
 
@@ -607,9 +609,9 @@ constexpr const GUID& aafIdOf(const IAAFVaryingValue*) {
 struct IEnumAAFControlPoints : IUnknown {
     virtual HRESULT NextOne(IAAFControlPoint** controlPoints) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFControlPoint** controlPoints,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;                // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                      // 5
+    virtual HRESULT Reset() = 0;                                    // 6
     virtual HRESULT Clone(IEnumAAFControlPoints** enumerator) = 0;  // 7
 
 protected:
@@ -623,11 +625,11 @@ constexpr const GUID& aafIdOf(const IEnumAAFControlPoints*) {
 
 // Answered by EnumAAFParameters.
 struct IEnumAAFParameters : IUnknown {
-    virtual HRESULT NextOne(IAAFParameter** parameter) = 0;  // 3
+    virtual HRESULT NextOne(IAAFParameter** parameter) = 0;                                     // 3
     virtual HRESULT Next(aafUInt32 count, IAAFParameter** parameters, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFParameters** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                  // 5
+    virtual HRESULT Reset() = 0;                                                                // 6
+    virtual HRESULT Clone(IEnumAAFParameters** enumerator) = 0;                                 // 7
 
 protected:
     ~IEnumAAFParameters() = default;

@@ -42,57 +42,57 @@ struct IEnumAAFTypeDefs;
 struct IAAFDictionary : IUnknown {
     virtual HRESULT CreateInstance(aafUID_constref id, REFIID riid, IUnknown** object) = 0;  // 3
     virtual HRESULT CreateMetaInstance(aafUID_constref id, REFIID riid,
-                                       IUnknown** metaDefinition) = 0;  // 4
-    virtual HRESULT RegisterClassDef(IAAFClassDef* classDef) = 0;  // 5
+                                       IUnknown** metaDefinition) = 0;                     // 4
+    virtual HRESULT RegisterClassDef(IAAFClassDef* classDef) = 0;                          // 5
     virtual HRESULT LookupClassDef(aafUID_constref classId, IAAFClassDef** classDef) = 0;  // 6
-    virtual HRESULT GetClassDefs(IEnumAAFClassDefs** enumerator) = 0;  // 7
-    virtual HRESULT CountClassDefs(aafUInt32* result) = 0;  // 8
-    virtual HRESULT CreateForwardClassReference(aafUID_constref classId) = 0;  // 9
+    virtual HRESULT GetClassDefs(IEnumAAFClassDefs** enumerator) = 0;                      // 7
+    virtual HRESULT CountClassDefs(aafUInt32* result) = 0;                                 // 8
+    virtual HRESULT CreateForwardClassReference(aafUID_constref classId) = 0;              // 9
     virtual HRESULT HasForwardClassReference(aafUID_constref classId,
-                                             aafBoolean_t* result) = 0;  // 10
-    virtual HRESULT RegisterTypeDef(IAAFTypeDef* typeDef) = 0;  // 11
-    virtual HRESULT LookupTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;  // 12
-    virtual HRESULT GetTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;  // 13
-    virtual HRESULT CountTypeDefs(aafUInt32* result) = 0;  // 14
-    virtual HRESULT RegisterOpaqueTypeDef(IAAFTypeDef* typeDef) = 0;  // 15
+                                             aafBoolean_t* result) = 0;                      // 10
+    virtual HRESULT RegisterTypeDef(IAAFTypeDef* typeDef) = 0;                               // 11
+    virtual HRESULT LookupTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;        // 12
+    virtual HRESULT GetTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                          // 13
+    virtual HRESULT CountTypeDefs(aafUInt32* result) = 0;                                    // 14
+    virtual HRESULT RegisterOpaqueTypeDef(IAAFTypeDef* typeDef) = 0;                         // 15
     virtual HRESULT LookupOpaqueTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;  // 16
-    virtual HRESULT GetOpaqueTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;  // 17
-    virtual HRESULT CountOpaqueTypeDefs(aafUInt32* result) = 0;  // 18
-    virtual HRESULT RegisterKLVDataKey(aafUID_t uid, IAAFTypeDef* typeDef) = 0;  // 19
-    virtual HRESULT RegisterDataDef(IAAFDataDef* dataDef) = 0;  // 20
+    virtual HRESULT GetOpaqueTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                    // 17
+    virtual HRESULT CountOpaqueTypeDefs(aafUInt32* result) = 0;                              // 18
+    virtual HRESULT RegisterKLVDataKey(aafUID_t uid, IAAFTypeDef* typeDef) = 0;              // 19
+    virtual HRESULT RegisterDataDef(IAAFDataDef* dataDef) = 0;                               // 20
     virtual HRESULT LookupDataDef(aafUID_constref dataDefinitionId,
-                                  IAAFDataDef** dataDef) = 0;  // 21
-    virtual HRESULT GetDataDefs(IEnumAAFDataDefs** enumerator) = 0;  // 22
-    virtual HRESULT CountDataDefs(aafUInt32* result) = 0;  // 23
+                                  IAAFDataDef** dataDef) = 0;                  // 21
+    virtual HRESULT GetDataDefs(IEnumAAFDataDefs** enumerator) = 0;            // 22
+    virtual HRESULT CountDataDefs(aafUInt32* result) = 0;                      // 23
     virtual HRESULT RegisterOperationDef(IAAFOperationDef* operationDef) = 0;  // 24
     virtual HRESULT LookupOperationDef(aafUID_constref operationId,
-                                       IAAFOperationDef** operationDef) = 0;  // 25
+                                       IAAFOperationDef** operationDef) = 0;   // 25
     virtual HRESULT GetOperationDefs(IEnumAAFOperationDefs** enumerator) = 0;  // 26
-    virtual HRESULT CountOperationDefs(aafUInt32* result) = 0;  // 27
-    virtual HRESULT RegisterParameterDef(IAAFParameterDef* parmDef) = 0;  // 28
+    virtual HRESULT CountOperationDefs(aafUInt32* result) = 0;                 // 27
+    virtual HRESULT RegisterParameterDef(IAAFParameterDef* parmDef) = 0;       // 28
     virtual HRESULT LookupParameterDef(aafUID_constref parameterId,
-                                       IAAFParameterDef** parmDef) = 0;  // 29
-    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;  // 30
-    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;  // 31
-    virtual HRESULT RegisterCodecDef(IAAFCodecDef* parmDef) = 0;  // 32
+                                       IAAFParameterDef** parmDef) = 0;                       // 29
+    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;                 // 30
+    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;                                // 31
+    virtual HRESULT RegisterCodecDef(IAAFCodecDef* parmDef) = 0;                              // 32
     virtual HRESULT LookupCodecDef(aafUID_constref parameterId, IAAFCodecDef** parmDef) = 0;  // 33
-    virtual HRESULT GetCodecDefs(IEnumAAFCodecDefs** enumerator) = 0;  // 34
-    virtual HRESULT CountCodecDefs(aafUInt32* result) = 0;  // 35
-    virtual HRESULT RegisterContainerDef(IAAFContainerDef* parmDef) = 0;  // 36
+    virtual HRESULT GetCodecDefs(IEnumAAFCodecDefs** enumerator) = 0;                         // 34
+    virtual HRESULT CountCodecDefs(aafUInt32* result) = 0;                                    // 35
+    virtual HRESULT RegisterContainerDef(IAAFContainerDef* parmDef) = 0;                      // 36
     virtual HRESULT LookupContainerDef(aafUID_constref parameterId,
-                                       IAAFContainerDef** parmDef) = 0;  // 37
-    virtual HRESULT GetContainerDefs(IEnumAAFContainerDefs** enumerator) = 0;  // 38
-    virtual HRESULT CountContainerDefs(aafUInt32* result) = 0;  // 39
+                                       IAAFContainerDef** parmDef) = 0;                    // 37
+    virtual HRESULT GetContainerDefs(IEnumAAFContainerDefs** enumerator) = 0;              // 38
+    virtual HRESULT CountContainerDefs(aafUInt32* result) = 0;                             // 39
     virtual HRESULT RegisterInterpolationDef(IAAFInterpolationDef* interpolationDef) = 0;  // 40
     virtual HRESULT LookupInterpolationDef(aafUID_constref parameterId,
                                            IAAFInterpolationDef** interpolationDef) = 0;  // 41
-    virtual HRESULT GetInterpolationDefs(IEnumAAFInterpolationDefs** enumerator) = 0;  // 42
-    virtual HRESULT CountInterpolationDefs(aafUInt32* result) = 0;  // 43
-    virtual HRESULT RegisterPluginDef(IAAFPluginDef* plugDef) = 0;  // 44
+    virtual HRESULT GetInterpolationDefs(IEnumAAFInterpolationDefs** enumerator) = 0;     // 42
+    virtual HRESULT CountInterpolationDefs(aafUInt32* result) = 0;                        // 43
+    virtual HRESULT RegisterPluginDef(IAAFPluginDef* plugDef) = 0;                        // 44
     virtual HRESULT LookupPluginDef(aafUID_constref parameterId,
-                                    IAAFPluginDef** plugDef) = 0;  // 45
+                                    IAAFPluginDef** plugDef) = 0;        // 45
     virtual HRESULT GetPluginDefs(IEnumAAFPluginDefs** enumerator) = 0;  // 46
-    virtual HRESULT CountPluginDefs(aafUInt32* result) = 0;  // 47
+    virtual HRESULT CountPluginDefs(aafUInt32* result) = 0;              // 47
 
 protected:
     ~IAAFDictionary() = default;
@@ -107,77 +107,77 @@ constexpr const GUID& aafIdOf(const IAAFDictionary*) {
 struct IAAFDictionary2 : IUnknown {
     virtual HRESULT CreateInstance(aafUID_constref id, REFIID riid, IUnknown** object) = 0;  // 3
     virtual HRESULT CreateMetaInstance(aafUID_constref id, REFIID riid,
-                                       IUnknown** metaDefinition) = 0;  // 4
-    virtual HRESULT RegisterClassDef(IAAFClassDef* classDef) = 0;  // 5
+                                       IUnknown** metaDefinition) = 0;                     // 4
+    virtual HRESULT RegisterClassDef(IAAFClassDef* classDef) = 0;                          // 5
     virtual HRESULT LookupClassDef(aafUID_constref classId, IAAFClassDef** classDef) = 0;  // 6
-    virtual HRESULT GetClassDefs(IEnumAAFClassDefs** enumerator) = 0;  // 7
-    virtual HRESULT CountClassDefs(aafUInt32* result) = 0;  // 8
-    virtual HRESULT CreateForwardClassReference(aafUID_constref classId) = 0;  // 9
+    virtual HRESULT GetClassDefs(IEnumAAFClassDefs** enumerator) = 0;                      // 7
+    virtual HRESULT CountClassDefs(aafUInt32* result) = 0;                                 // 8
+    virtual HRESULT CreateForwardClassReference(aafUID_constref classId) = 0;              // 9
     virtual HRESULT HasForwardClassReference(aafUID_constref classId,
-                                             aafBoolean_t* result) = 0;  // 10
-    virtual HRESULT RegisterTypeDef(IAAFTypeDef* typeDef) = 0;  // 11
-    virtual HRESULT LookupTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;  // 12
-    virtual HRESULT GetTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;  // 13
-    virtual HRESULT CountTypeDefs(aafUInt32* result) = 0;  // 14
-    virtual HRESULT RegisterOpaqueTypeDef(IAAFTypeDef* typeDef) = 0;  // 15
+                                             aafBoolean_t* result) = 0;                      // 10
+    virtual HRESULT RegisterTypeDef(IAAFTypeDef* typeDef) = 0;                               // 11
+    virtual HRESULT LookupTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;        // 12
+    virtual HRESULT GetTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                          // 13
+    virtual HRESULT CountTypeDefs(aafUInt32* result) = 0;                                    // 14
+    virtual HRESULT RegisterOpaqueTypeDef(IAAFTypeDef* typeDef) = 0;                         // 15
     virtual HRESULT LookupOpaqueTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;  // 16
-    virtual HRESULT GetOpaqueTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;  // 17
-    virtual HRESULT CountOpaqueTypeDefs(aafUInt32* result) = 0;  // 18
-    virtual HRESULT RegisterKLVDataKey(aafUID_t uid, IAAFTypeDef* typeDef) = 0;  // 19
-    virtual HRESULT RegisterDataDef(IAAFDataDef* dataDef) = 0;  // 20
+    virtual HRESULT GetOpaqueTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                    // 17
+    virtual HRESULT CountOpaqueTypeDefs(aafUInt32* result) = 0;                              // 18
+    virtual HRESULT RegisterKLVDataKey(aafUID_t uid, IAAFTypeDef* typeDef) = 0;              // 19
+    virtual HRESULT RegisterDataDef(IAAFDataDef* dataDef) = 0;                               // 20
     virtual HRESULT LookupDataDef(aafUID_constref dataDefinitionId,
-                                  IAAFDataDef** dataDef) = 0;  // 21
-    virtual HRESULT GetDataDefs(IEnumAAFDataDefs** enumerator) = 0;  // 22
-    virtual HRESULT CountDataDefs(aafUInt32* result) = 0;  // 23
+                                  IAAFDataDef** dataDef) = 0;                  // 21
+    virtual HRESULT GetDataDefs(IEnumAAFDataDefs** enumerator) = 0;            // 22
+    virtual HRESULT CountDataDefs(aafUInt32* result) = 0;                      // 23
     virtual HRESULT RegisterOperationDef(IAAFOperationDef* operationDef) = 0;  // 24
     virtual HRESULT LookupOperationDef(aafUID_constref operationId,
-                                       IAAFOperationDef** operationDef) = 0;  // 25
+                                       IAAFOperationDef** operationDef) = 0;   // 25
     virtual HRESULT GetOperationDefs(IEnumAAFOperationDefs** enumerator) = 0;  // 26
-    virtual HRESULT CountOperationDefs(aafUInt32* result) = 0;  // 27
-    virtual HRESULT RegisterParameterDef(IAAFParameterDef* parmDef) = 0;  // 28
+    virtual HRESULT CountOperationDefs(aafUInt32* result) = 0;                 // 27
+    virtual HRESULT RegisterParameterDef(IAAFParameterDef* parmDef) = 0;       // 28
     virtual HRESULT LookupParameterDef(aafUID_constref parameterId,
-                                       IAAFParameterDef** parmDef) = 0;  // 29
-    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;  // 30
-    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;  // 31
-    virtual HRESULT RegisterCodecDef(IAAFCodecDef* parmDef) = 0;  // 32
+                                       IAAFParameterDef** parmDef) = 0;                       // 29
+    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;                 // 30
+    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;                                // 31
+    virtual HRESULT RegisterCodecDef(IAAFCodecDef* parmDef) = 0;                              // 32
     virtual HRESULT LookupCodecDef(aafUID_constref parameterId, IAAFCodecDef** parmDef) = 0;  // 33
-    virtual HRESULT GetCodecDefs(IEnumAAFCodecDefs** enumerator) = 0;  // 34
-    virtual HRESULT CountCodecDefs(aafUInt32* result) = 0;  // 35
-    virtual HRESULT RegisterContainerDef(IAAFContainerDef* parmDef) = 0;  // 36
+    virtual HRESULT GetCodecDefs(IEnumAAFCodecDefs** enumerator) = 0;                         // 34
+    virtual HRESULT CountCodecDefs(aafUInt32* result) = 0;                                    // 35
+    virtual HRESULT RegisterContainerDef(IAAFContainerDef* parmDef) = 0;                      // 36
     virtual HRESULT LookupContainerDef(aafUID_constref parameterId,
-                                       IAAFContainerDef** parmDef) = 0;  // 37
-    virtual HRESULT GetContainerDefs(IEnumAAFContainerDefs** enumerator) = 0;  // 38
-    virtual HRESULT CountContainerDefs(aafUInt32* result) = 0;  // 39
+                                       IAAFContainerDef** parmDef) = 0;                    // 37
+    virtual HRESULT GetContainerDefs(IEnumAAFContainerDefs** enumerator) = 0;              // 38
+    virtual HRESULT CountContainerDefs(aafUInt32* result) = 0;                             // 39
     virtual HRESULT RegisterInterpolationDef(IAAFInterpolationDef* interpolationDef) = 0;  // 40
     virtual HRESULT LookupInterpolationDef(aafUID_constref parameterId,
                                            IAAFInterpolationDef** interpolationDef) = 0;  // 41
-    virtual HRESULT GetInterpolationDefs(IEnumAAFInterpolationDefs** enumerator) = 0;  // 42
-    virtual HRESULT CountInterpolationDefs(aafUInt32* result) = 0;  // 43
-    virtual HRESULT RegisterPluginDef(IAAFPluginDef* plugDef) = 0;  // 44
+    virtual HRESULT GetInterpolationDefs(IEnumAAFInterpolationDefs** enumerator) = 0;     // 42
+    virtual HRESULT CountInterpolationDefs(aafUInt32* result) = 0;                        // 43
+    virtual HRESULT RegisterPluginDef(IAAFPluginDef* plugDef) = 0;                        // 44
     virtual HRESULT LookupPluginDef(aafUID_constref parameterId,
-                                    IAAFPluginDef** plugDef) = 0;  // 45
-    virtual HRESULT GetPluginDefs(IEnumAAFPluginDefs** enumerator) = 0;  // 46
-    virtual HRESULT CountPluginDefs(aafUInt32* result) = 0;  // 47
-    virtual HRESULT RegisterKLVDataDef(IAAFKLVDataDefinition* def) = 0;  // 48
+                                    IAAFPluginDef** plugDef) = 0;                              // 45
+    virtual HRESULT GetPluginDefs(IEnumAAFPluginDefs** enumerator) = 0;                        // 46
+    virtual HRESULT CountPluginDefs(aafUInt32* result) = 0;                                    // 47
+    virtual HRESULT RegisterKLVDataDef(IAAFKLVDataDefinition* def) = 0;                        // 48
     virtual HRESULT LookupKLVDataDef(aafUID_constref defId, IAAFKLVDataDefinition** def) = 0;  // 49
-    virtual HRESULT GetKLVDataDefs(IEnumAAFKLVDataDefs** enumerator) = 0;  // 50
-    virtual HRESULT CountKLVDataDefs(aafUInt32* result) = 0;  // 51
-    virtual HRESULT RegisterTaggedValueDef(IAAFTaggedValueDefinition* def) = 0;  // 52
+    virtual HRESULT GetKLVDataDefs(IEnumAAFKLVDataDefs** enumerator) = 0;                      // 50
+    virtual HRESULT CountKLVDataDefs(aafUInt32* result) = 0;                                   // 51
+    virtual HRESULT RegisterTaggedValueDef(IAAFTaggedValueDefinition* def) = 0;                // 52
     virtual HRESULT LookupTaggedValueDef(aafUID_constref defId,
-                                         IAAFTaggedValueDefinition** def) = 0;  // 53
+                                         IAAFTaggedValueDefinition** def) = 0;     // 53
     virtual HRESULT GetTaggedValueDefs(IEnumAAFTaggedValueDefs** enumerator) = 0;  // 54
-    virtual HRESULT CountTaggedValueDefs(aafUInt32* result) = 0;  // 55
-    virtual HRESULT LookupAuxiliaryDataDef(IAAFDataDef** dataDef) = 0;  // 56
-    virtual HRESULT LookupDescriptiveMetadataDataDef(IAAFDataDef** dataDef) = 0;  // 57
-    virtual HRESULT LookupEdgecodeDataDef(IAAFDataDef** dataDef) = 0;  // 58
-    virtual HRESULT LookupLegacyPictureDataDef(IAAFDataDef** dataDef) = 0;  // 59
-    virtual HRESULT LookupLegacySoundDataDef(IAAFDataDef** dataDef) = 0;  // 60
-    virtual HRESULT LookupLegacyTimecodeDataDef(IAAFDataDef** dataDef) = 0;  // 61
-    virtual HRESULT LookupMatteDataDef(IAAFDataDef** dataDef) = 0;  // 62
-    virtual HRESULT LookupPictureDataDef(IAAFDataDef** dataDef) = 0;  // 63
-    virtual HRESULT LookupPictureWithMatteDataDef(IAAFDataDef** dataDef) = 0;  // 64
-    virtual HRESULT LookupSoundDataDef(IAAFDataDef** dataDef) = 0;  // 65
-    virtual HRESULT LookupTimecodeDataDef(IAAFDataDef** dataDef) = 0;  // 66
+    virtual HRESULT CountTaggedValueDefs(aafUInt32* result) = 0;                   // 55
+    virtual HRESULT LookupAuxiliaryDataDef(IAAFDataDef** dataDef) = 0;             // 56
+    virtual HRESULT LookupDescriptiveMetadataDataDef(IAAFDataDef** dataDef) = 0;   // 57
+    virtual HRESULT LookupEdgecodeDataDef(IAAFDataDef** dataDef) = 0;              // 58
+    virtual HRESULT LookupLegacyPictureDataDef(IAAFDataDef** dataDef) = 0;         // 59
+    virtual HRESULT LookupLegacySoundDataDef(IAAFDataDef** dataDef) = 0;           // 60
+    virtual HRESULT LookupLegacyTimecodeDataDef(IAAFDataDef** dataDef) = 0;        // 61
+    virtual HRESULT LookupMatteDataDef(IAAFDataDef** dataDef) = 0;                 // 62
+    virtual HRESULT LookupPictureDataDef(IAAFDataDef** dataDef) = 0;               // 63
+    virtual HRESULT LookupPictureWithMatteDataDef(IAAFDataDef** dataDef) = 0;      // 64
+    virtual HRESULT LookupSoundDataDef(IAAFDataDef** dataDef) = 0;                 // 65
+    virtual HRESULT LookupTimecodeDataDef(IAAFDataDef** dataDef) = 0;              // 66
 
 protected:
     ~IAAFDictionary2() = default;
@@ -190,14 +190,14 @@ constexpr const GUID& aafIdOf(const IAAFDictionary2*) {
 
 // Answered by AAFDefObject.
 struct IAAFDefObject : IUnknown {
-    virtual HRESULT SetName(aafCharacter_constptr name) = 0;  // 3
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 4
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 5
-    virtual HRESULT SetDescription(aafCharacter_constptr description) = 0;  // 6
+    virtual HRESULT SetName(aafCharacter_constptr name) = 0;                           // 3
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;                // 4
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                             // 5
+    virtual HRESULT SetDescription(aafCharacter_constptr description) = 0;             // 6
     virtual HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) = 0;  // 7
-    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;  // 8
-    virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name) = 0;  // 9
-    virtual HRESULT GetAUID(aafUID_t* auid) = 0;  // 10
+    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;                      // 8
+    virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name) = 0;    // 9
+    virtual HRESULT GetAUID(aafUID_t* auid) = 0;                                       // 10
 
 protected:
     ~IAAFDefObject() = default;
@@ -211,13 +211,13 @@ constexpr const GUID& aafIdOf(const IAAFDefObject*) {
 // Answered by AAFDataDef.
 struct IAAFDataDef : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT IsPictureKind(aafBoolean_t* bIsPictureKind) = 0;  // 4
-    virtual HRESULT IsMatteKind(aafBoolean_t* bIsMatteKind) = 0;  // 5
-    virtual HRESULT IsPictureWithMatteKind(aafBoolean_t* bIsPictureWithMatteKind) = 0;  // 6
-    virtual HRESULT IsSoundKind(aafBoolean_t* bIsSoundKind) = 0;  // 7
+                               aafCharacter_constptr description) = 0;                        // 3
+    virtual HRESULT IsPictureKind(aafBoolean_t* bIsPictureKind) = 0;                          // 4
+    virtual HRESULT IsMatteKind(aafBoolean_t* bIsMatteKind) = 0;                              // 5
+    virtual HRESULT IsPictureWithMatteKind(aafBoolean_t* bIsPictureWithMatteKind) = 0;        // 6
+    virtual HRESULT IsSoundKind(aafBoolean_t* bIsSoundKind) = 0;                              // 7
     virtual HRESULT DoesDataDefConvertTo(IAAFDataDef* id, aafBoolean_t* bDoesConvertTo) = 0;  // 8
-    virtual HRESULT IsDataDefOf(IAAFDataDef* dataDef, aafBoolean_t* bIsDataDefOf) = 0;  // 9
+    virtual HRESULT IsDataDefOf(IAAFDataDef* dataDef, aafBoolean_t* bIsDataDefOf) = 0;        // 9
     virtual HRESULT DoesDataDefConvertFrom(IAAFDataDef* dataDef,
                                            aafBoolean_t* bDoesConvertFrom) = 0;  // 10
 
@@ -233,17 +233,17 @@ constexpr const GUID& aafIdOf(const IAAFDataDef*) {
 // Answered by AAFDataDef.
 struct IAAFDataDef2 : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT IsPictureKind(aafBoolean_t* bIsPictureKind) = 0;  // 4
-    virtual HRESULT IsMatteKind(aafBoolean_t* bIsMatteKind) = 0;  // 5
-    virtual HRESULT IsPictureWithMatteKind(aafBoolean_t* bIsPictureWithMatteKind) = 0;  // 6
-    virtual HRESULT IsSoundKind(aafBoolean_t* bIsSoundKind) = 0;  // 7
+                               aafCharacter_constptr description) = 0;                        // 3
+    virtual HRESULT IsPictureKind(aafBoolean_t* bIsPictureKind) = 0;                          // 4
+    virtual HRESULT IsMatteKind(aafBoolean_t* bIsMatteKind) = 0;                              // 5
+    virtual HRESULT IsPictureWithMatteKind(aafBoolean_t* bIsPictureWithMatteKind) = 0;        // 6
+    virtual HRESULT IsSoundKind(aafBoolean_t* bIsSoundKind) = 0;                              // 7
     virtual HRESULT DoesDataDefConvertTo(IAAFDataDef* id, aafBoolean_t* bDoesConvertTo) = 0;  // 8
-    virtual HRESULT IsDataDefOf(IAAFDataDef* dataDef, aafBoolean_t* bIsDataDefOf) = 0;  // 9
+    virtual HRESULT IsDataDefOf(IAAFDataDef* dataDef, aafBoolean_t* bIsDataDefOf) = 0;        // 9
     virtual HRESULT DoesDataDefConvertFrom(IAAFDataDef* dataDef,
                                            aafBoolean_t* bDoesConvertFrom) = 0;  // 10
-    virtual HRESULT IsEdgecodeKind(aafBoolean_t* bIsEdgecodeKind) = 0;  // 11
-    virtual HRESULT IsTimecodeKind(aafBoolean_t* bIsTimecodeKind) = 0;  // 12
+    virtual HRESULT IsEdgecodeKind(aafBoolean_t* bIsEdgecodeKind) = 0;           // 11
+    virtual HRESULT IsTimecodeKind(aafBoolean_t* bIsTimecodeKind) = 0;           // 12
 
 protected:
     ~IAAFDataDef2() = default;
@@ -257,18 +257,18 @@ constexpr const GUID& aafIdOf(const IAAFDataDef2*) {
 // Answered by AAFDataDef.
 struct IAAFDataDef3 : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT IsPictureKind(aafBoolean_t* bIsPictureKind) = 0;  // 4
-    virtual HRESULT IsMatteKind(aafBoolean_t* bIsMatteKind) = 0;  // 5
-    virtual HRESULT IsPictureWithMatteKind(aafBoolean_t* bIsPictureWithMatteKind) = 0;  // 6
-    virtual HRESULT IsSoundKind(aafBoolean_t* bIsSoundKind) = 0;  // 7
+                               aafCharacter_constptr description) = 0;                        // 3
+    virtual HRESULT IsPictureKind(aafBoolean_t* bIsPictureKind) = 0;                          // 4
+    virtual HRESULT IsMatteKind(aafBoolean_t* bIsMatteKind) = 0;                              // 5
+    virtual HRESULT IsPictureWithMatteKind(aafBoolean_t* bIsPictureWithMatteKind) = 0;        // 6
+    virtual HRESULT IsSoundKind(aafBoolean_t* bIsSoundKind) = 0;                              // 7
     virtual HRESULT DoesDataDefConvertTo(IAAFDataDef* id, aafBoolean_t* bDoesConvertTo) = 0;  // 8
-    virtual HRESULT IsDataDefOf(IAAFDataDef* dataDef, aafBoolean_t* bIsDataDefOf) = 0;  // 9
+    virtual HRESULT IsDataDefOf(IAAFDataDef* dataDef, aafBoolean_t* bIsDataDefOf) = 0;        // 9
     virtual HRESULT DoesDataDefConvertFrom(IAAFDataDef* dataDef,
-                                           aafBoolean_t* bDoesConvertFrom) = 0;  // 10
-    virtual HRESULT IsEdgecodeKind(aafBoolean_t* bIsEdgecodeKind) = 0;  // 11
-    virtual HRESULT IsTimecodeKind(aafBoolean_t* bIsTimecodeKind) = 0;  // 12
-    virtual HRESULT IsAuxiliaryKind(aafBoolean_t* bIsAuxiliaryKind) = 0;  // 13
+                                           aafBoolean_t* bDoesConvertFrom) = 0;               // 10
+    virtual HRESULT IsEdgecodeKind(aafBoolean_t* bIsEdgecodeKind) = 0;                        // 11
+    virtual HRESULT IsTimecodeKind(aafBoolean_t* bIsTimecodeKind) = 0;                        // 12
+    virtual HRESULT IsAuxiliaryKind(aafBoolean_t* bIsAuxiliaryKind) = 0;                      // 13
     virtual HRESULT IsDescriptiveMetadataKind(aafBoolean_t* bIsDescriptiveMetadataKind) = 0;  // 14
 
 protected:
@@ -283,8 +283,8 @@ constexpr const GUID& aafIdOf(const IAAFDataDef3*) {
 // Answered by AAFContainerDef.
 struct IAAFContainerDef : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT EssenceIsIdentified(aafBoolean_t* essenceIsIdentified) = 0;  // 4
+                               aafCharacter_constptr description) = 0;             // 3
+    virtual HRESULT EssenceIsIdentified(aafBoolean_t* essenceIsIdentified) = 0;    // 4
     virtual HRESULT SetEssenceIsIdentified(aafBoolean_t essenceIsIdentified) = 0;  // 5
 
 protected:
@@ -298,11 +298,11 @@ constexpr const GUID& aafIdOf(const IAAFContainerDef*) {
 
 // Answered by EnumAAFDataDefs.
 struct IEnumAAFDataDefs : IUnknown {
-    virtual HRESULT NextOne(IAAFDataDef** dataDefs) = 0;  // 3
+    virtual HRESULT NextOne(IAAFDataDef** dataDefs) = 0;                                       // 3
     virtual HRESULT Next(aafUInt32 count, IAAFDataDef** dataDefs, aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFDataDefs** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                 // 5
+    virtual HRESULT Reset() = 0;                                                               // 6
+    virtual HRESULT Clone(IEnumAAFDataDefs** enumerator) = 0;                                  // 7
 
 protected:
     ~IEnumAAFDataDefs() = default;
@@ -317,9 +317,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFDataDefs*) {
 struct IEnumAAFContainerDefs : IUnknown {
     virtual HRESULT NextOne(IAAFContainerDef** containerDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFContainerDef** containerDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;                // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                      // 5
+    virtual HRESULT Reset() = 0;                                    // 6
     virtual HRESULT Clone(IEnumAAFContainerDefs** enumerator) = 0;  // 7
 
 protected:
@@ -336,14 +336,14 @@ struct IAAFCodecDef : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
                                aafCharacter_constptr description) = 0;  // 3
     virtual HRESULT IsEssenceKindSupported(IAAFDataDef* essenceKind,
-                                           aafBoolean_t* isSupported) = 0;  // 4
-    virtual HRESULT AddEssenceKind(IAAFDataDef* essenceKind) = 0;  // 5
-    virtual HRESULT RemoveEssenceKind(IAAFDataDef* essenceKind) = 0;  // 6
-    virtual HRESULT CountEssenceKinds(aafUInt32* result) = 0;  // 7
-    virtual HRESULT GetEssenceKinds(IEnumAAFDataDefs** enumerator) = 0;  // 8
-    virtual HRESULT AreThereFlavours(aafBoolean_t* result) = 0;  // 9
-    virtual HRESULT GetFileDescriptorClass(IAAFClassDef** cls) = 0;  // 10
-    virtual HRESULT SetFileDescriptorClass(IAAFClassDef* cls) = 0;  // 11
+                                           aafBoolean_t* isSupported) = 0;      // 4
+    virtual HRESULT AddEssenceKind(IAAFDataDef* essenceKind) = 0;               // 5
+    virtual HRESULT RemoveEssenceKind(IAAFDataDef* essenceKind) = 0;            // 6
+    virtual HRESULT CountEssenceKinds(aafUInt32* result) = 0;                   // 7
+    virtual HRESULT GetEssenceKinds(IEnumAAFDataDefs** enumerator) = 0;         // 8
+    virtual HRESULT AreThereFlavours(aafBoolean_t* result) = 0;                 // 9
+    virtual HRESULT GetFileDescriptorClass(IAAFClassDef** cls) = 0;             // 10
+    virtual HRESULT SetFileDescriptorClass(IAAFClassDef* cls) = 0;              // 11
     virtual HRESULT EnumCodecFlavours(IEnumAAFCodecFlavours** enumerator) = 0;  // 12
 
 protected:
@@ -359,9 +359,9 @@ constexpr const GUID& aafIdOf(const IAAFCodecDef*) {
 struct IEnumAAFCodecDefs : IUnknown {
     virtual HRESULT NextOne(IAAFCodecDef** codecDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFCodecDef** codecDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;            // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                  // 5
+    virtual HRESULT Reset() = 0;                                // 6
     virtual HRESULT Clone(IEnumAAFCodecDefs** enumerator) = 0;  // 7
 
 protected:
@@ -390,13 +390,13 @@ constexpr const GUID& aafIdOf(const IAAFInterpolationDef*) {
 // Answered by AAFKLVDataDefinition.
 struct IAAFKLVDataDefinition : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT AddParentProperty(IAAFPropertyDef* parentProperty) = 0;  // 4
+                               aafCharacter_constptr description) = 0;           // 3
+    virtual HRESULT AddParentProperty(IAAFPropertyDef* parentProperty) = 0;      // 4
     virtual HRESULT GetParentProperties(IEnumAAFPropertyDefs** enumerator) = 0;  // 5
-    virtual HRESULT CountParentProperties(aafUInt32* numProperties) = 0;  // 6
-    virtual HRESULT RemoveParentProperty(IAAFPropertyDef* parentProperty) = 0;  // 7
-    virtual HRESULT GetKLVDataType(IAAFTypeDef** typeDef) = 0;  // 8
-    virtual HRESULT SetKLVDataType(IAAFTypeDef* typeDef) = 0;  // 9
+    virtual HRESULT CountParentProperties(aafUInt32* numProperties) = 0;         // 6
+    virtual HRESULT RemoveParentProperty(IAAFPropertyDef* parentProperty) = 0;   // 7
+    virtual HRESULT GetKLVDataType(IAAFTypeDef** typeDef) = 0;                   // 8
+    virtual HRESULT SetKLVDataType(IAAFTypeDef* typeDef) = 0;                    // 9
 
 protected:
     ~IAAFKLVDataDefinition() = default;
@@ -410,27 +410,27 @@ constexpr const GUID& aafIdOf(const IAAFKLVDataDefinition*) {
 // Answered by AAFOperationDef.
 struct IAAFOperationDef : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT GetDataDef(IAAFDataDef** dataDef) = 0;  // 4
-    virtual HRESULT SetDataDef(IAAFDataDef* dataDef) = 0;  // 5
-    virtual HRESULT IsTimeWarp(aafBoolean_t* bIsTimeWarp) = 0;  // 6
-    virtual HRESULT SetIsTimeWarp(aafBoolean_t isTimeWarp) = 0;  // 7
+                               aafCharacter_constptr description) = 0;              // 3
+    virtual HRESULT GetDataDef(IAAFDataDef** dataDef) = 0;                          // 4
+    virtual HRESULT SetDataDef(IAAFDataDef* dataDef) = 0;                           // 5
+    virtual HRESULT IsTimeWarp(aafBoolean_t* bIsTimeWarp) = 0;                      // 6
+    virtual HRESULT SetIsTimeWarp(aafBoolean_t isTimeWarp) = 0;                     // 7
     virtual HRESULT PrependDegradeToOperation(IAAFOperationDef* operationDef) = 0;  // 8
-    virtual HRESULT AppendDegradeToOperation(IAAFOperationDef* operationDef) = 0;  // 9
+    virtual HRESULT AppendDegradeToOperation(IAAFOperationDef* operationDef) = 0;   // 9
     virtual HRESULT InsertDegradeToOperationAt(aafUInt32 index,
                                                IAAFOperationDef* operationDef) = 0;  // 10
-    virtual HRESULT RemoveDegradeToOperationAt(aafUInt32 index) = 0;  // 11
+    virtual HRESULT RemoveDegradeToOperationAt(aafUInt32 index) = 0;                 // 11
     virtual HRESULT GetDegradeToOperations(IEnumAAFOperationDefs** enumerator) = 0;  // 12
-    virtual HRESULT CountDegradeToOperations(aafUInt32* result) = 0;  // 13
-    virtual HRESULT GetCategory(aafUID_t* value) = 0;  // 14
-    virtual HRESULT SetCategory(aafUID_constref value) = 0;  // 15
-    virtual HRESULT GetNumberInputs(aafInt32* numberInputs) = 0;  // 16
-    virtual HRESULT SetNumberInputs(aafInt32 numberInputs) = 0;  // 17
-    virtual HRESULT GetBypass(aafUInt32* bypass) = 0;  // 18
-    virtual HRESULT SetBypass(aafUInt32 bypass) = 0;  // 19
-    virtual HRESULT AddParameterDef(IAAFParameterDef* parameterDef) = 0;  // 20
-    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;  // 21
-    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;  // 22
+    virtual HRESULT CountDegradeToOperations(aafUInt32* result) = 0;                 // 13
+    virtual HRESULT GetCategory(aafUID_t* value) = 0;                                // 14
+    virtual HRESULT SetCategory(aafUID_constref value) = 0;                          // 15
+    virtual HRESULT GetNumberInputs(aafInt32* numberInputs) = 0;                     // 16
+    virtual HRESULT SetNumberInputs(aafInt32 numberInputs) = 0;                      // 17
+    virtual HRESULT GetBypass(aafUInt32* bypass) = 0;                                // 18
+    virtual HRESULT SetBypass(aafUInt32 bypass) = 0;                                 // 19
+    virtual HRESULT AddParameterDef(IAAFParameterDef* parameterDef) = 0;             // 20
+    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;        // 21
+    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;                       // 22
     virtual HRESULT LookupParameterDef(aafUID_constref parameterDefId,
                                        IAAFParameterDef** parameterDef) = 0;  // 23
 
@@ -447,10 +447,10 @@ constexpr const GUID& aafIdOf(const IAAFOperationDef*) {
 struct IAAFParameterDef : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
                                aafCharacter_constptr description, IAAFTypeDef* type) = 0;  // 3
-    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;  // 4
-    virtual HRESULT SetDisplayUnits(aafCharacter_constptr displayUnits) = 0;  // 5
-    virtual HRESULT GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) = 0;  // 6
-    virtual HRESULT GetDisplayUnitsBufLen(aafUInt32* bufSize) = 0;  // 7
+    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;                          // 4
+    virtual HRESULT SetDisplayUnits(aafCharacter_constptr displayUnits) = 0;               // 5
+    virtual HRESULT GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) = 0;    // 6
+    virtual HRESULT GetDisplayUnitsBufLen(aafUInt32* bufSize) = 0;                         // 7
 
 protected:
     ~IAAFParameterDef() = default;
@@ -464,56 +464,57 @@ constexpr const GUID& aafIdOf(const IAAFParameterDef*) {
 // Answered by AAFPluginDef.
 struct IAAFPluginDef : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT GetCategoryClass(aafUID_t* categoryClass) = 0;  // 4
-    virtual HRESULT SetCategoryClass(aafUID_constref categoryClass) = 0;  // 5
-    virtual HRESULT GetPluginVersion(aafVersionType_t* version) = 0;  // 6
-    virtual HRESULT SetPluginVersion(aafVersionType_t* version) = 0;  // 7
+                               aafCharacter_constptr description) = 0;                      // 3
+    virtual HRESULT GetCategoryClass(aafUID_t* categoryClass) = 0;                          // 4
+    virtual HRESULT SetCategoryClass(aafUID_constref categoryClass) = 0;                    // 5
+    virtual HRESULT GetPluginVersion(aafVersionType_t* version) = 0;                        // 6
+    virtual HRESULT SetPluginVersion(aafVersionType_t* version) = 0;                        // 7
     virtual HRESULT SetPluginVersionString(aafCharacter_constptr pluginVersionString) = 0;  // 8
     virtual HRESULT GetPluginVersionString(aafCharacter* pluginVersionString,
-                                           aafUInt32 bufSize) = 0;  // 9
+                                           aafUInt32 bufSize) = 0;         // 9
     virtual HRESULT GetPluginVersionStringBufLen(aafUInt32* bufSize) = 0;  // 10
-    virtual HRESULT SetPluginManufacturerName(aafCharacter_constptr pluginManufacturerName) = 0;  // 11
+    virtual HRESULT SetPluginManufacturerName(
+        aafCharacter_constptr pluginManufacturerName) = 0;  // 11
     virtual HRESULT GetPluginManufacturerName(aafCharacter* pluginManufacturerName,
-                                              aafUInt32 bufSize) = 0;  // 12
-    virtual HRESULT GetPluginManufacturerNameBufLen(aafUInt32* bufSize) = 0;  // 13
-    virtual HRESULT GetManufacturerInfo(IAAFNetworkLocator** result) = 0;  // 14
-    virtual HRESULT SetManufacturerInfo(IAAFNetworkLocator* manufacturerInfo) = 0;  // 15
-    virtual HRESULT GetManufacturerID(aafUID_t* manufacturerID) = 0;  // 16
-    virtual HRESULT SetManufacturerID(aafUID_constref manufacturerID) = 0;  // 17
-    virtual HRESULT GetHardwarePlatform(aafHardwarePlatform_t* hardwarePlatform) = 0;  // 18
+                                              aafUInt32 bufSize) = 0;                        // 12
+    virtual HRESULT GetPluginManufacturerNameBufLen(aafUInt32* bufSize) = 0;                 // 13
+    virtual HRESULT GetManufacturerInfo(IAAFNetworkLocator** result) = 0;                    // 14
+    virtual HRESULT SetManufacturerInfo(IAAFNetworkLocator* manufacturerInfo) = 0;           // 15
+    virtual HRESULT GetManufacturerID(aafUID_t* manufacturerID) = 0;                         // 16
+    virtual HRESULT SetManufacturerID(aafUID_constref manufacturerID) = 0;                   // 17
+    virtual HRESULT GetHardwarePlatform(aafHardwarePlatform_t* hardwarePlatform) = 0;        // 18
     virtual HRESULT SetHardwarePlatform(aafHardwarePlatform_constref hardwarePlatform) = 0;  // 19
     virtual HRESULT GetPlatformVersionRange(aafVersionType_t* minVersion,
-                                            aafVersionType_t* maxVersion) = 0;  // 20
+                                            aafVersionType_t* maxVersion) = 0;          // 20
     virtual HRESULT SetPlatformMinimumVersion(aafVersionType_constref minVersion) = 0;  // 21
     virtual HRESULT SetPlatformMaximumVersion(aafVersionType_constref maxVersion) = 0;  // 22
-    virtual HRESULT GetEngine(aafEngine_t* engine) = 0;  // 23
-    virtual HRESULT SetEngine(aafEngine_constref engine) = 0;  // 24
+    virtual HRESULT GetEngine(aafEngine_t* engine) = 0;                                 // 23
+    virtual HRESULT SetEngine(aafEngine_constref engine) = 0;                           // 24
     virtual HRESULT GetEngineVersionRange(aafVersionType_t* minVersion,
-                                          aafVersionType_t* maxVersion) = 0;  // 25
+                                          aafVersionType_t* maxVersion) = 0;          // 25
     virtual HRESULT SetEngineMinimumVersion(aafVersionType_constref minVersion) = 0;  // 26
     virtual HRESULT SetEngineMaximumVersion(aafVersionType_constref maxVersion) = 0;  // 27
-    virtual HRESULT GetPluginAPI(aafPluginAPI_t* pluginAPI) = 0;  // 28
-    virtual HRESULT SetPluginAPI(aafPluginAPI_constref pluginAPI) = 0;  // 29
+    virtual HRESULT GetPluginAPI(aafPluginAPI_t* pluginAPI) = 0;                      // 28
+    virtual HRESULT SetPluginAPI(aafPluginAPI_constref pluginAPI) = 0;                // 29
     virtual HRESULT GetPluginAPIVersionRange(aafVersionType_t* minVersion,
-                                             aafVersionType_t* maxVersion) = 0;  // 30
+                                             aafVersionType_t* maxVersion) = 0;          // 30
     virtual HRESULT SetPluginAPIMinimumVersion(aafVersionType_constref minVersion) = 0;  // 31
     virtual HRESULT SetPluginAPIMaximumVersion(aafVersionType_constref maxVersion) = 0;  // 32
-    virtual HRESULT IsSoftwareOnly(aafBoolean_t* isSoftwareOnly) = 0;  // 33
-    virtual HRESULT SetIsSoftwareOnly(aafBoolean_t isSoftwareOnly) = 0;  // 34
-    virtual HRESULT IsAccelerated(aafBoolean_t* isAccelerated) = 0;  // 35
-    virtual HRESULT SetIsAccelerated(aafBoolean_t isAccelerated) = 0;  // 36
-    virtual HRESULT SupportsAuthentication(aafBoolean_t* supportsAuthentication) = 0;  // 37
+    virtual HRESULT IsSoftwareOnly(aafBoolean_t* isSoftwareOnly) = 0;                    // 33
+    virtual HRESULT SetIsSoftwareOnly(aafBoolean_t isSoftwareOnly) = 0;                  // 34
+    virtual HRESULT IsAccelerated(aafBoolean_t* isAccelerated) = 0;                      // 35
+    virtual HRESULT SetIsAccelerated(aafBoolean_t isAccelerated) = 0;                    // 36
+    virtual HRESULT SupportsAuthentication(aafBoolean_t* supportsAuthentication) = 0;    // 37
     virtual HRESULT SetSupportsAuthentication(aafBoolean_t supportsAuthentication) = 0;  // 38
-    virtual HRESULT CountLocators(aafUInt32* result) = 0;  // 39
-    virtual HRESULT AppendLocator(IAAFLocator* locator) = 0;  // 40
-    virtual HRESULT PrependLocator(IAAFLocator* locator) = 0;  // 41
-    virtual HRESULT InsertLocatorAt(aafUInt32 index, IAAFLocator* locator) = 0;  // 42
-    virtual HRESULT GetLocatorAt(aafUInt32 index, IAAFLocator** locator) = 0;  // 43
-    virtual HRESULT RemoveLocatorAt(aafUInt32 index) = 0;  // 44
-    virtual HRESULT GetLocators(IEnumAAFPluginLocators** enumerator) = 0;  // 45
-    virtual HRESULT SetDefinitionObjectID(aafUID_t def) = 0;  // 46
-    virtual HRESULT GetDefinitionObjectID(aafUID_t* def) = 0;  // 47
+    virtual HRESULT CountLocators(aafUInt32* result) = 0;                                // 39
+    virtual HRESULT AppendLocator(IAAFLocator* locator) = 0;                             // 40
+    virtual HRESULT PrependLocator(IAAFLocator* locator) = 0;                            // 41
+    virtual HRESULT InsertLocatorAt(aafUInt32 index, IAAFLocator* locator) = 0;          // 42
+    virtual HRESULT GetLocatorAt(aafUInt32 index, IAAFLocator** locator) = 0;            // 43
+    virtual HRESULT RemoveLocatorAt(aafUInt32 index) = 0;                                // 44
+    virtual HRESULT GetLocators(IEnumAAFPluginLocators** enumerator) = 0;                // 45
+    virtual HRESULT SetDefinitionObjectID(aafUID_t def) = 0;                             // 46
+    virtual HRESULT GetDefinitionObjectID(aafUID_t* def) = 0;                            // 47
 
 protected:
     ~IAAFPluginDef() = default;
@@ -526,13 +527,12 @@ constexpr const GUID& aafIdOf(const IAAFPluginDef*) {
 
 // Answered by AAFPluginManager.
 struct IAAFPluginManager : IUnknown {
-    virtual HRESULT RegisterSharedPlugins() = 0;  // 3
+    virtual HRESULT RegisterSharedPlugins() = 0;                                       // 3
     virtual HRESULT RegisterPluginDirectory(aafCharacter_constptr directoryName) = 0;  // 4
-    virtual HRESULT RegisterPluginFile(aafCharacter_constptr fileName) = 0;  // 5
+    virtual HRESULT RegisterPluginFile(aafCharacter_constptr fileName) = 0;            // 5
     virtual HRESULT EnumLoadedPlugins(aafUID_constref categoryID,
                                       IEnumAAFLoadedPlugins** enumerator) = 0;  // 6
-    virtual HRESULT CreatePluginDefinition(aafUID_constref pluginDefID,
-                                           IAAFDictionary* dictionary,
+    virtual HRESULT CreatePluginDefinition(aafUID_constref pluginDefID, IAAFDictionary* dictionary,
                                            IAAFDefObject** pluginDef) = 0;  // 7
     virtual HRESULT CreateInstance(REFCLSID rclsid, IUnknown* unkOuter, REFIID riid,
                                    void** plugin) = 0;  // 8
@@ -549,28 +549,29 @@ constexpr const GUID& aafIdOf(const IAAFPluginManager*) {
 // Answered by AAFTaggedValueDefinition.
 struct IAAFTaggedValueDefinition : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT AddParentProperty(IAAFPropertyDef* parentProperty) = 0;  // 4
+                               aafCharacter_constptr description) = 0;           // 3
+    virtual HRESULT AddParentProperty(IAAFPropertyDef* parentProperty) = 0;      // 4
     virtual HRESULT GetParentProperties(IEnumAAFPropertyDefs** enumerator) = 0;  // 5
-    virtual HRESULT CountParentProperties(aafUInt32* numProperties) = 0;  // 6
-    virtual HRESULT RemoveParentProperty(IAAFPropertyDef* parentProperty) = 0;  // 7
+    virtual HRESULT CountParentProperties(aafUInt32* numProperties) = 0;         // 6
+    virtual HRESULT RemoveParentProperty(IAAFPropertyDef* parentProperty) = 0;   // 7
 
 protected:
     ~IAAFTaggedValueDefinition() = default;
 };
 
-inline constexpr GUID IID_IAAFTaggedValueDefinition = ncfGuid("C358428A-BF73-4558-BFDF-482160719823");
+inline constexpr GUID IID_IAAFTaggedValueDefinition =
+    ncfGuid("C358428A-BF73-4558-BFDF-482160719823");
 constexpr const GUID& aafIdOf(const IAAFTaggedValueDefinition*) {
     return IID_IAAFTaggedValueDefinition;
 }
 
 // Answered by EnumAAFCodecFlavours.
 struct IEnumAAFCodecFlavours : IUnknown {
-    virtual HRESULT NextOne(aafUID_t* AAFCodecFlavour) = 0;  // 3
+    virtual HRESULT NextOne(aafUID_t* AAFCodecFlavour) = 0;                                     // 3
     virtual HRESULT Next(aafUInt32 count, aafUID_t* AAFCodecFlavours, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFCodecFlavours** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                  // 5
+    virtual HRESULT Reset() = 0;                                                                // 6
+    virtual HRESULT Clone(IEnumAAFCodecFlavours** enumerator) = 0;                              // 7
 
 protected:
     ~IEnumAAFCodecFlavours() = default;
@@ -585,16 +586,17 @@ constexpr const GUID& aafIdOf(const IEnumAAFCodecFlavours*) {
 struct IEnumAAFInterpolationDefs : IUnknown {
     virtual HRESULT NextOne(IAAFInterpolationDef** interpolationDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFInterpolationDef** interpolationDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;                    // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                          // 5
+    virtual HRESULT Reset() = 0;                                        // 6
     virtual HRESULT Clone(IEnumAAFInterpolationDefs** enumerator) = 0;  // 7
 
 protected:
     ~IEnumAAFInterpolationDefs() = default;
 };
 
-inline constexpr GUID IID_IEnumAAFInterpolationDefs = ncfGuid("293600A5-0D37-11D3-80A9-006008143E6F");
+inline constexpr GUID IID_IEnumAAFInterpolationDefs =
+    ncfGuid("293600A5-0D37-11D3-80A9-006008143E6F");
 constexpr const GUID& aafIdOf(const IEnumAAFInterpolationDefs*) {
     return IID_IEnumAAFInterpolationDefs;
 }
@@ -603,9 +605,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFInterpolationDefs*) {
 struct IEnumAAFKLVDataDefs : IUnknown {
     virtual HRESULT NextOne(IAAFKLVDataDefinition** KLVDataDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFKLVDataDefinition** KLVDataDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;              // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                    // 5
+    virtual HRESULT Reset() = 0;                                  // 6
     virtual HRESULT Clone(IEnumAAFKLVDataDefs** enumerator) = 0;  // 7
 
 protected:
@@ -619,11 +621,11 @@ constexpr const GUID& aafIdOf(const IEnumAAFKLVDataDefs*) {
 
 // Answered by EnumAAFLoadedPlugins.
 struct IEnumAAFLoadedPlugins : IUnknown {
-    virtual HRESULT NextOne(aafUID_t* AAFPluginID) = 0;  // 3
+    virtual HRESULT NextOne(aafUID_t* AAFPluginID) = 0;                                     // 3
     virtual HRESULT Next(aafUInt32 count, aafUID_t* AAFPluginIDs, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFLoadedPlugins** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                              // 5
+    virtual HRESULT Reset() = 0;                                                            // 6
+    virtual HRESULT Clone(IEnumAAFLoadedPlugins** enumerator) = 0;                          // 7
 
 protected:
     ~IEnumAAFLoadedPlugins() = default;
@@ -638,9 +640,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFLoadedPlugins*) {
 struct IEnumAAFOperationDefs : IUnknown {
     virtual HRESULT NextOne(IAAFOperationDef** operationDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFOperationDef** operationDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;                // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                      // 5
+    virtual HRESULT Reset() = 0;                                    // 6
     virtual HRESULT Clone(IEnumAAFOperationDefs** enumerator) = 0;  // 7
 
 protected:
@@ -656,9 +658,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFOperationDefs*) {
 struct IEnumAAFParameterDefs : IUnknown {
     virtual HRESULT NextOne(IAAFParameterDef** parameterDef) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFParameterDef** parameterDefs,
-                         aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* fetched) = 0;                   // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                      // 5
+    virtual HRESULT Reset() = 0;                                    // 6
     virtual HRESULT Clone(IEnumAAFParameterDefs** enumerator) = 0;  // 7
 
 protected:
@@ -674,9 +676,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFParameterDefs*) {
 struct IEnumAAFPluginDefs : IUnknown {
     virtual HRESULT NextOne(IAAFPluginDef** pluginDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFPluginDef** pluginDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;             // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                   // 5
+    virtual HRESULT Reset() = 0;                                 // 6
     virtual HRESULT Clone(IEnumAAFPluginDefs** enumerator) = 0;  // 7
 
 protected:
@@ -690,11 +692,11 @@ constexpr const GUID& aafIdOf(const IEnumAAFPluginDefs*) {
 
 // Answered by EnumAAFPluginLocators.
 struct IEnumAAFPluginLocators : IUnknown {
-    virtual HRESULT NextOne(IAAFLocator** AAFLocator) = 0;  // 3
+    virtual HRESULT NextOne(IAAFLocator** AAFLocator) = 0;                                     // 3
     virtual HRESULT Next(aafUInt32 count, IAAFLocator** AAFLocators, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFPluginLocators** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                 // 5
+    virtual HRESULT Reset() = 0;                                                               // 6
+    virtual HRESULT Clone(IEnumAAFPluginLocators** enumerator) = 0;                            // 7
 
 protected:
     ~IEnumAAFPluginLocators() = default;
@@ -709,9 +711,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFPluginLocators*) {
 struct IEnumAAFTaggedValueDefs : IUnknown {
     virtual HRESULT NextOne(IAAFTaggedValueDefinition** taggedValueDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFTaggedValueDefinition** taggedValueDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;                  // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                        // 5
+    virtual HRESULT Reset() = 0;                                      // 6
     virtual HRESULT Clone(IEnumAAFTaggedValueDefs** enumerator) = 0;  // 7
 
 protected:

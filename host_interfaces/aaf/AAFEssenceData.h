@@ -19,9 +19,9 @@ struct IEnumAAFEssenceData;
 struct IEnumAAFEssenceData : IUnknown {
     virtual HRESULT NextOne(IAAFEssenceData** essenceData) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFEssenceData** essenceData,
-                         aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* fetched) = 0;                 // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                    // 5
+    virtual HRESULT Reset() = 0;                                  // 6
     virtual HRESULT Clone(IEnumAAFEssenceData** enumerator) = 0;  // 7
 
 protected:
@@ -37,14 +37,14 @@ constexpr const GUID& aafIdOf(const IEnumAAFEssenceData*) {
 struct IAAFEssenceData : IUnknown {
     virtual HRESULT Initialize(IAAFSourceMob* fileMob) = 0;  // 3
     virtual HRESULT Write(aafUInt32 bytes, aafDataBuffer_t buffer,
-                          aafUInt32* bytesWritten) = 0;  // 4
+                          aafUInt32* bytesWritten) = 0;                                       // 4
     virtual HRESULT Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) = 0;  // 5
-    virtual HRESULT SetPosition(aafPosition_t offset) = 0;  // 6
-    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;  // 7
-    virtual HRESULT GetSize(aafLength_t* size) = 0;  // 8
-    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;  // 9
-    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;  // 10
-    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;  // 11
+    virtual HRESULT SetPosition(aafPosition_t offset) = 0;                                    // 6
+    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;                                   // 7
+    virtual HRESULT GetSize(aafLength_t* size) = 0;                                           // 8
+    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;                                   // 9
+    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;                                  // 10
+    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;                                  // 11
 
 protected:
     ~IAAFEssenceData() = default;
@@ -59,21 +59,21 @@ constexpr const GUID& aafIdOf(const IAAFEssenceData*) {
 struct IAAFEssenceData2 : IUnknown {
     virtual HRESULT Initialize(IAAFSourceMob* fileMob) = 0;  // 3
     virtual HRESULT Write(aafUInt32 bytes, aafDataBuffer_t buffer,
-                          aafUInt32* bytesWritten) = 0;  // 4
+                          aafUInt32* bytesWritten) = 0;                                       // 4
     virtual HRESULT Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) = 0;  // 5
-    virtual HRESULT SetPosition(aafPosition_t offset) = 0;  // 6
-    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;  // 7
-    virtual HRESULT GetSize(aafLength_t* size) = 0;  // 8
+    virtual HRESULT SetPosition(aafPosition_t offset) = 0;                                    // 6
+    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;                                   // 7
+    virtual HRESULT GetSize(aafLength_t* size) = 0;                                           // 8
     virtual HRESULT WriteSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
                                      aafUInt32* bytesWritten) = 0;  // 9
     virtual HRESULT ReadSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
-                                    aafUInt32* bytesRead) = 0;  // 10
-    virtual HRESULT SetSampleIndexPosition(aafPosition_t offset) = 0;  // 11
+                                    aafUInt32* bytesRead) = 0;          // 10
+    virtual HRESULT SetSampleIndexPosition(aafPosition_t offset) = 0;   // 11
     virtual HRESULT GetSampleIndexPosition(aafPosition_t* offset) = 0;  // 12
-    virtual HRESULT GetSampleIndexSize(aafLength_t* size) = 0;  // 13
-    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;  // 14
-    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;  // 15
-    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;  // 16
+    virtual HRESULT GetSampleIndexSize(aafLength_t* size) = 0;          // 13
+    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;             // 14
+    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;            // 15
+    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;            // 16
     virtual HRESULT GetPlainEssenceData(aafUInt32 reserved,
                                         IAAFPlainEssenceData** plainEssenceData) = 0;  // 17
 
@@ -93,20 +93,20 @@ struct IAAFEssenceAccess : IUnknown {
                                  aafUInt32* samplesWritten, aafUInt32* bytesWritten) = 0;  // 4
     virtual HRESULT GetLargestSampleSize(IAAFDataDef* dataDef, aafLength_t* maxSize) = 0;  // 5
     virtual HRESULT GetIndexedSampleSize(IAAFDataDef* dataDef, aafPosition_t frameNum,
-                                         aafLength_t* frameSize) = 0;  // 6
-    virtual HRESULT SetTransformParameters(IAAFEssenceFormat* op) = 0;  // 7
+                                         aafLength_t* frameSize) = 0;             // 6
+    virtual HRESULT SetTransformParameters(IAAFEssenceFormat* op) = 0;            // 7
     virtual HRESULT CountSamples(IAAFDataDef* dataDef, aafLength_t* result) = 0;  // 8
     virtual HRESULT ReadSamples(aafUInt32 nSamples, aafUInt32 buflen, aafDataBuffer_t buffer,
                                 aafUInt32* samplesRead, aafUInt32* bytesRead) = 0;  // 9
-    virtual HRESULT Seek(aafPosition_t sampleFrameNum) = 0;  // 10
+    virtual HRESULT Seek(aafPosition_t sampleFrameNum) = 0;                         // 10
     virtual HRESULT GetFileFormat(IAAFEssenceFormat* opsTemplate,
-                                  IAAFEssenceFormat** opsResult) = 0;  // 11
+                                  IAAFEssenceFormat** opsResult) = 0;         // 11
     virtual HRESULT GetFileFormatParameterList(IAAFEssenceFormat** ops) = 0;  // 12
-    virtual HRESULT GetEmptyFileFormat(IAAFEssenceFormat** ops) = 0;  // 13
-    virtual HRESULT PutFileFormat(IAAFEssenceFormat* ops) = 0;  // 14
+    virtual HRESULT GetEmptyFileFormat(IAAFEssenceFormat** ops) = 0;          // 13
+    virtual HRESULT PutFileFormat(IAAFEssenceFormat* ops) = 0;                // 14
     virtual HRESULT GetCodecName(aafUInt32 namelen, aafCharacter* name) = 0;  // 15
-    virtual HRESULT GetCodecID(aafCodecID_t* codecID) = 0;  // 16
-    virtual HRESULT CompleteWrite() = 0;  // 17
+    virtual HRESULT GetCodecID(aafCodecID_t* codecID) = 0;                    // 16
+    virtual HRESULT CompleteWrite() = 0;                                      // 17
 
 protected:
     ~IAAFEssenceAccess() = default;
@@ -121,21 +121,21 @@ constexpr const GUID& aafIdOf(const IAAFEssenceAccess*) {
 struct IAAFEssenceDataEx : IUnknown {
     virtual HRESULT Initialize(IAAFSourceMob* fileMob) = 0;  // 3
     virtual HRESULT Write(aafUInt32 bytes, aafDataBuffer_t buffer,
-                          aafUInt32* bytesWritten) = 0;  // 4
+                          aafUInt32* bytesWritten) = 0;                                       // 4
     virtual HRESULT Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) = 0;  // 5
-    virtual HRESULT SetPosition(aafPosition_t offset) = 0;  // 6
-    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;  // 7
-    virtual HRESULT GetSize(aafLength_t* size) = 0;  // 8
+    virtual HRESULT SetPosition(aafPosition_t offset) = 0;                                    // 6
+    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;                                   // 7
+    virtual HRESULT GetSize(aafLength_t* size) = 0;                                           // 8
     virtual HRESULT WriteSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
                                      aafUInt32* bytesWritten) = 0;  // 9
     virtual HRESULT ReadSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
-                                    aafUInt32* bytesRead) = 0;  // 10
-    virtual HRESULT SetSampleIndexPosition(aafPosition_t offset) = 0;  // 11
+                                    aafUInt32* bytesRead) = 0;          // 10
+    virtual HRESULT SetSampleIndexPosition(aafPosition_t offset) = 0;   // 11
     virtual HRESULT GetSampleIndexPosition(aafPosition_t* offset) = 0;  // 12
-    virtual HRESULT GetSampleIndexSize(aafLength_t* size) = 0;  // 13
-    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;  // 14
-    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;  // 15
-    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;  // 16
+    virtual HRESULT GetSampleIndexSize(aafLength_t* size) = 0;          // 13
+    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;             // 14
+    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;            // 15
+    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;            // 16
 
 protected:
     ~IAAFEssenceDataEx() = default;
@@ -152,7 +152,7 @@ struct IAAFEssenceFormat : IUnknown {
                                        aafDataBuffer_t value) = 0;  // 3
     virtual HRESULT GetFormatSpecifier(aafUID_constref essenceFormatCode, aafInt32 valueSize,
                                        aafDataBuffer_t value, aafInt32* bytesRead) = 0;  // 4
-    virtual HRESULT NumFormatSpecifiers(aafInt32* numSpecifiers) = 0;  // 5
+    virtual HRESULT NumFormatSpecifiers(aafInt32* numSpecifiers) = 0;                    // 5
     virtual HRESULT GetIndexedFormatSpecifier(aafInt32 index, aafUID_t* essenceFormatCode,
                                               aafInt32 valueSize, aafDataBuffer_t value,
                                               aafInt32* bytesRead) = 0;  // 6
@@ -185,13 +185,14 @@ constexpr const GUID& aafIdOf(const IAAFEssenceMultiAccess*) {
 // Answered by AAFPlainEssenceData.
 struct IAAFKLVEssenceDataParameters : IUnknown {
     virtual HRESULT GetEssenceElementKey(aafUID_t* essenceElementKey) = 0;  // 3
-    virtual HRESULT SetEssenceElementKey(aafUID_constref key) = 0;  // 4
+    virtual HRESULT SetEssenceElementKey(aafUID_constref key) = 0;          // 4
 
 protected:
     ~IAAFKLVEssenceDataParameters() = default;
 };
 
-inline constexpr GUID IID_IAAFKLVEssenceDataParameters = ncfGuid("CC2AF9AE-EDAD-4B30-9E3E-5BA692380A84");
+inline constexpr GUID IID_IAAFKLVEssenceDataParameters =
+    ncfGuid("CC2AF9AE-EDAD-4B30-9E3E-5BA692380A84");
 constexpr const GUID& aafIdOf(const IAAFKLVEssenceDataParameters*) {
     return IID_IAAFKLVEssenceDataParameters;
 }
@@ -216,21 +217,21 @@ constexpr const GUID& aafIdOf(const IAAFKLVStreamParameters*) {
 struct IAAFPlainEssenceData : IUnknown {
     virtual HRESULT Initialize(IAAFSourceMob* fileMob) = 0;  // 3
     virtual HRESULT Write(aafUInt32 bytes, aafDataBuffer_t buffer,
-                          aafUInt32* bytesWritten) = 0;  // 4
+                          aafUInt32* bytesWritten) = 0;                                       // 4
     virtual HRESULT Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) = 0;  // 5
-    virtual HRESULT SetPosition(aafPosition_t offset) = 0;  // 6
-    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;  // 7
-    virtual HRESULT GetSize(aafLength_t* size) = 0;  // 8
+    virtual HRESULT SetPosition(aafPosition_t offset) = 0;                                    // 6
+    virtual HRESULT GetPosition(aafPosition_t* offset) = 0;                                   // 7
+    virtual HRESULT GetSize(aafLength_t* size) = 0;                                           // 8
     virtual HRESULT WriteSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
                                      aafUInt32* bytesWritten) = 0;  // 9
     virtual HRESULT ReadSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
-                                    aafUInt32* bytesRead) = 0;  // 10
-    virtual HRESULT SetSampleIndexPosition(aafPosition_t offset) = 0;  // 11
+                                    aafUInt32* bytesRead) = 0;          // 10
+    virtual HRESULT SetSampleIndexPosition(aafPosition_t offset) = 0;   // 11
     virtual HRESULT GetSampleIndexPosition(aafPosition_t* offset) = 0;  // 12
-    virtual HRESULT GetSampleIndexSize(aafLength_t* size) = 0;  // 13
-    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;  // 14
-    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;  // 15
-    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;  // 16
+    virtual HRESULT GetSampleIndexSize(aafLength_t* size) = 0;          // 13
+    virtual HRESULT SetFileMob(IAAFSourceMob* fileMob) = 0;             // 14
+    virtual HRESULT GetFileMob(IAAFSourceMob** fileMob) = 0;            // 15
+    virtual HRESULT GetFileMobID(aafMobID_t* fileMobID) = 0;            // 16
 
 protected:
     ~IAAFPlainEssenceData() = default;
@@ -243,7 +244,7 @@ constexpr const GUID& aafIdOf(const IAAFPlainEssenceData*) {
 
 // Answered by AAFPlainStreamData.
 struct IAAFPlainStreamData : IUnknown {
-    virtual HRESULT GetSize(IAAFPropertyValue* streamPropertyValue, aafInt64* size) = 0;  // 3
+    virtual HRESULT GetSize(IAAFPropertyValue* streamPropertyValue, aafInt64* size) = 0;    // 3
     virtual HRESULT SetSize(IAAFPropertyValue* streamPropertyValue, aafInt64 newSize) = 0;  // 4
     virtual HRESULT GetPosition(IAAFPropertyValue* streamPropertyValue,
                                 aafInt64* position) = 0;  // 5
@@ -260,16 +261,16 @@ struct IAAFPlainStreamData : IUnknown {
     virtual HRESULT GetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
                                        eAAFByteOrder_t* byteOrder) = 0;  // 11
     virtual HRESULT SetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
-                                       eAAFByteOrder_t byteOrder) = 0;  // 12
+                                       eAAFByteOrder_t byteOrder) = 0;                 // 12
     virtual HRESULT ClearStoredByteOrder(IAAFPropertyValue* streamPropertyValue) = 0;  // 13
     virtual HRESULT ReadElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
                                  aafUInt32 dataSize, aafMemPtr_t data,
                                  aafUInt32* bytesRead) = 0;  // 14
-    virtual HRESULT WriteElements(IAAFPropertyValue* streamPropertyValue,
-                                  IAAFTypeDef* elementType, aafUInt32 dataSize,
+    virtual HRESULT WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                  aafUInt32 dataSize,
                                   aafMemPtr_t data) = 0;  // 15
-    virtual HRESULT AppendElements(IAAFPropertyValue* streamPropertyValue,
-                                   IAAFTypeDef* elementType, aafUInt32 dataSize,
+    virtual HRESULT AppendElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                   aafUInt32 dataSize,
                                    aafMemPtr_t data) = 0;  // 16
 
 protected:

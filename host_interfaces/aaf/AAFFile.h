@@ -23,12 +23,12 @@ struct IEnumAAFMobs;
 
 // Answered by AAFFile.
 struct IAAFFile : IUnknown {
-    virtual HRESULT Open() = 0;  // 3
-    virtual HRESULT SaveCopyAs(IAAFFile* destFile) = 0;  // 4
-    virtual HRESULT GetHeader(IAAFHeader** header) = 0;  // 5
-    virtual HRESULT GetRevision(aafFileRev_t* rev) = 0;  // 6
-    virtual HRESULT Save() = 0;  // 7
-    virtual HRESULT Close() = 0;  // 8
+    virtual HRESULT Open() = 0;                                      // 3
+    virtual HRESULT SaveCopyAs(IAAFFile* destFile) = 0;              // 4
+    virtual HRESULT GetHeader(IAAFHeader** header) = 0;              // 5
+    virtual HRESULT GetRevision(aafFileRev_t* rev) = 0;              // 6
+    virtual HRESULT Save() = 0;                                      // 7
+    virtual HRESULT Close() = 0;                                     // 8
     virtual HRESULT GetDictionary(IAAFDictionary** dictionary) = 0;  // 9
 
 protected:
@@ -42,32 +42,32 @@ constexpr const GUID& aafIdOf(const IAAFFile*) {
 
 // Answered by AAFHeader.
 struct IAAFHeader : IUnknown {
-    virtual HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) = 0;  // 3
-    virtual HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) = 0;  // 4
+    virtual HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) = 0;                    // 3
+    virtual HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) = 0;               // 4
     virtual HRESULT GetMobs(aafSearchCrit_t* searchCriteria, IEnumAAFMobs** enumerator) = 0;  // 5
-    virtual HRESULT AddMob(IAAFMob* mob) = 0;  // 6
-    virtual HRESULT RemoveMob(IAAFMob* mob) = 0;  // 7
-    virtual HRESULT CountEssenceData(aafUInt32* result) = 0;  // 8
+    virtual HRESULT AddMob(IAAFMob* mob) = 0;                                                 // 6
+    virtual HRESULT RemoveMob(IAAFMob* mob) = 0;                                              // 7
+    virtual HRESULT CountEssenceData(aafUInt32* result) = 0;                                  // 8
     virtual HRESULT IsEssenceDataPresent(aafMobID_constref fileMobID, aafFileFormat_t fmt,
-                                         aafBoolean_t* result) = 0;  // 9
+                                         aafBoolean_t* result) = 0;         // 9
     virtual HRESULT EnumEssenceData(IEnumAAFEssenceData** enumerator) = 0;  // 10
-    virtual HRESULT AddEssenceData(IAAFEssenceData* essenceData) = 0;  // 11
-    virtual HRESULT RemoveEssenceData(IAAFEssenceData* essenceData) = 0;  // 12
+    virtual HRESULT AddEssenceData(IAAFEssenceData* essenceData) = 0;       // 11
+    virtual HRESULT RemoveEssenceData(IAAFEssenceData* essenceData) = 0;    // 12
     virtual HRESULT LookupEssenceData(aafMobID_constref mobID,
-                                      IAAFEssenceData** essenceData) = 0;  // 13
-    virtual HRESULT GetDictionary(IAAFDictionary** dictionary) = 0;  // 14
+                                      IAAFEssenceData** essenceData) = 0;            // 13
+    virtual HRESULT GetDictionary(IAAFDictionary** dictionary) = 0;                  // 14
     virtual HRESULT GetLastIdentification(IAAFIdentification** identification) = 0;  // 15
     virtual HRESULT LookupIdentification(aafUID_constref generation,
                                          IAAFIdentification** identification) = 0;  // 16
-    virtual HRESULT CountIdentifications(aafUInt32* result) = 0;  // 17
-    virtual HRESULT GetIdentifications(IEnumAAFIdentifications** enumerator) = 0;  // 18
-    virtual HRESULT AppendIdentification(IAAFIdentification* ident) = 0;  // 19
+    virtual HRESULT CountIdentifications(aafUInt32* result) = 0;                    // 17
+    virtual HRESULT GetIdentifications(IEnumAAFIdentifications** enumerator) = 0;   // 18
+    virtual HRESULT AppendIdentification(IAAFIdentification* ident) = 0;            // 19
     virtual HRESULT GetIdentificationAt(aafUInt32 index,
                                         IAAFIdentification** identification) = 0;  // 20
-    virtual HRESULT GetRefImplVersion(aafProductVersion_t* version) = 0;  // 21
-    virtual HRESULT GetFileRevision(aafVersionType_t* revision) = 0;  // 22
-    virtual HRESULT GetLastModified(aafTimeStamp_t* timeStamp) = 0;  // 23
-    virtual HRESULT GetContentStorage(IAAFContentStorage** storage) = 0;  // 24
+    virtual HRESULT GetRefImplVersion(aafProductVersion_t* version) = 0;           // 21
+    virtual HRESULT GetFileRevision(aafVersionType_t* revision) = 0;               // 22
+    virtual HRESULT GetLastModified(aafTimeStamp_t* timeStamp) = 0;                // 23
+    virtual HRESULT GetContentStorage(IAAFContentStorage** storage) = 0;           // 24
 
 protected:
     ~IAAFHeader() = default;
@@ -80,48 +80,48 @@ constexpr const GUID& aafIdOf(const IAAFHeader*) {
 
 // Answered by AAFHeader.
 struct IAAFHeader2 : IUnknown {
-    virtual HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) = 0;  // 3
-    virtual HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) = 0;  // 4
+    virtual HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) = 0;                    // 3
+    virtual HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) = 0;               // 4
     virtual HRESULT GetMobs(aafSearchCrit_t* searchCriteria, IEnumAAFMobs** enumerator) = 0;  // 5
-    virtual HRESULT AddMob(IAAFMob* mob) = 0;  // 6
-    virtual HRESULT RemoveMob(IAAFMob* mob) = 0;  // 7
-    virtual HRESULT CountEssenceData(aafUInt32* result) = 0;  // 8
+    virtual HRESULT AddMob(IAAFMob* mob) = 0;                                                 // 6
+    virtual HRESULT RemoveMob(IAAFMob* mob) = 0;                                              // 7
+    virtual HRESULT CountEssenceData(aafUInt32* result) = 0;                                  // 8
     virtual HRESULT IsEssenceDataPresent(aafMobID_constref fileMobID, aafFileFormat_t fmt,
-                                         aafBoolean_t* result) = 0;  // 9
+                                         aafBoolean_t* result) = 0;         // 9
     virtual HRESULT EnumEssenceData(IEnumAAFEssenceData** enumerator) = 0;  // 10
-    virtual HRESULT AddEssenceData(IAAFEssenceData* essenceData) = 0;  // 11
-    virtual HRESULT RemoveEssenceData(IAAFEssenceData* essenceData) = 0;  // 12
+    virtual HRESULT AddEssenceData(IAAFEssenceData* essenceData) = 0;       // 11
+    virtual HRESULT RemoveEssenceData(IAAFEssenceData* essenceData) = 0;    // 12
     virtual HRESULT LookupEssenceData(aafMobID_constref mobID,
-                                      IAAFEssenceData** essenceData) = 0;  // 13
-    virtual HRESULT GetDictionary(IAAFDictionary** dictionary) = 0;  // 14
+                                      IAAFEssenceData** essenceData) = 0;            // 13
+    virtual HRESULT GetDictionary(IAAFDictionary** dictionary) = 0;                  // 14
     virtual HRESULT GetLastIdentification(IAAFIdentification** identification) = 0;  // 15
     virtual HRESULT LookupIdentification(aafUID_constref generation,
                                          IAAFIdentification** identification) = 0;  // 16
-    virtual HRESULT CountIdentifications(aafUInt32* result) = 0;  // 17
-    virtual HRESULT GetIdentifications(IEnumAAFIdentifications** enumerator) = 0;  // 18
-    virtual HRESULT AppendIdentification(IAAFIdentification* ident) = 0;  // 19
+    virtual HRESULT CountIdentifications(aafUInt32* result) = 0;                    // 17
+    virtual HRESULT GetIdentifications(IEnumAAFIdentifications** enumerator) = 0;   // 18
+    virtual HRESULT AppendIdentification(IAAFIdentification* ident) = 0;            // 19
     virtual HRESULT GetIdentificationAt(aafUInt32 index,
-                                        IAAFIdentification** identification) = 0;  // 20
-    virtual HRESULT GetRefImplVersion(aafProductVersion_t* version) = 0;  // 21
-    virtual HRESULT GetFileRevision(aafVersionType_t* revision) = 0;  // 22
-    virtual HRESULT GetLastModified(aafTimeStamp_t* timeStamp) = 0;  // 23
-    virtual HRESULT GetContentStorage(IAAFContentStorage** storage) = 0;  // 24
-    virtual HRESULT GetPrimaryMob(IAAFMob** primaryMob) = 0;  // 25
-    virtual HRESULT SetPrimaryMob(IAAFMob* primaryMob) = 0;  // 26
-    virtual HRESULT GetOperationalPattern(aafUID_t* operationalPatternID) = 0;  // 27
+                                        IAAFIdentification** identification) = 0;     // 20
+    virtual HRESULT GetRefImplVersion(aafProductVersion_t* version) = 0;              // 21
+    virtual HRESULT GetFileRevision(aafVersionType_t* revision) = 0;                  // 22
+    virtual HRESULT GetLastModified(aafTimeStamp_t* timeStamp) = 0;                   // 23
+    virtual HRESULT GetContentStorage(IAAFContentStorage** storage) = 0;              // 24
+    virtual HRESULT GetPrimaryMob(IAAFMob** primaryMob) = 0;                          // 25
+    virtual HRESULT SetPrimaryMob(IAAFMob* primaryMob) = 0;                           // 26
+    virtual HRESULT GetOperationalPattern(aafUID_t* operationalPatternID) = 0;        // 27
     virtual HRESULT SetOperationalPattern(aafUID_constref operationalPatternID) = 0;  // 28
-    virtual HRESULT UpdateEssenceContainers() = 0;  // 29
-    virtual HRESULT CountEssenceContainers(aafUInt32* count) = 0;  // 30
+    virtual HRESULT UpdateEssenceContainers() = 0;                                    // 29
+    virtual HRESULT CountEssenceContainers(aafUInt32* count) = 0;                     // 30
     virtual HRESULT GetEssenceContainers(aafUInt32 maxEssenceContainersCount,
                                          aafUID_t* essenceContainerIDs) = 0;  // 31
     virtual HRESULT IsEssenceContainerPresent(aafUID_constref essenceContainerID,
                                               aafBoolean_t* isPresent) = 0;  // 32
-    virtual HRESULT CountDescriptiveSchemes(aafUInt32* count) = 0;  // 33
+    virtual HRESULT CountDescriptiveSchemes(aafUInt32* count) = 0;           // 33
     virtual HRESULT GetDescriptiveSchemes(aafUInt32 maxDescriptiveSchemesCount,
                                           aafUID_t* descriptiveSchemeIDs) = 0;  // 34
     virtual HRESULT IsDescriptiveSchemePresent(aafUID_constref descriptiveSchemeID,
-                                               aafBoolean_t* isPresent) = 0;  // 35
-    virtual HRESULT AddDescriptiveScheme(aafUID_constref descriptiveSchemeID) = 0;  // 36
+                                               aafBoolean_t* isPresent) = 0;           // 35
+    virtual HRESULT AddDescriptiveScheme(aafUID_constref descriptiveSchemeID) = 0;     // 36
     virtual HRESULT RemoveDescriptiveScheme(aafUID_constref descriptiveSchemeID) = 0;  // 37
 
 protected:
@@ -135,17 +135,17 @@ constexpr const GUID& aafIdOf(const IAAFHeader2*) {
 
 // Answered by AAFContentStorage.
 struct IAAFContentStorage : IUnknown {
-    virtual HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) = 0;  // 3
-    virtual HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) = 0;  // 4
+    virtual HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) = 0;                    // 3
+    virtual HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) = 0;               // 4
     virtual HRESULT GetMobs(aafSearchCrit_t* searchCriteria, IEnumAAFMobs** enumerator) = 0;  // 5
-    virtual HRESULT AddMob(IAAFMob* mob) = 0;  // 6
-    virtual HRESULT RemoveMob(IAAFMob* mob) = 0;  // 7
-    virtual HRESULT CountEssenceData(aafUInt32* result) = 0;  // 8
+    virtual HRESULT AddMob(IAAFMob* mob) = 0;                                                 // 6
+    virtual HRESULT RemoveMob(IAAFMob* mob) = 0;                                              // 7
+    virtual HRESULT CountEssenceData(aafUInt32* result) = 0;                                  // 8
     virtual HRESULT IsEssenceDataPresent(aafMobID_constref fileMobID, aafFileFormat_t fmt,
-                                         aafBoolean_t* result) = 0;  // 9
+                                         aafBoolean_t* result) = 0;         // 9
     virtual HRESULT EnumEssenceData(IEnumAAFEssenceData** enumerator) = 0;  // 10
-    virtual HRESULT AddEssenceData(IAAFEssenceData* essenceData) = 0;  // 11
-    virtual HRESULT RemoveEssenceData(IAAFEssenceData* essenceData) = 0;  // 12
+    virtual HRESULT AddEssenceData(IAAFEssenceData* essenceData) = 0;       // 11
+    virtual HRESULT RemoveEssenceData(IAAFEssenceData* essenceData) = 0;    // 12
     virtual HRESULT LookupEssenceData(aafMobID_constref mobID,
                                       IAAFEssenceData** essenceData) = 0;  // 13
 
@@ -160,25 +160,24 @@ constexpr const GUID& aafIdOf(const IAAFContentStorage*) {
 
 // Answered by AAFIdentification.
 struct IAAFIdentification : IUnknown {
-    virtual HRESULT Initialize(aafCharacter_constptr companyName,
-                               aafCharacter_constptr productName,
+    virtual HRESULT Initialize(aafCharacter_constptr companyName, aafCharacter_constptr productName,
                                aafCharacter_constptr productVersionString,
-                               aafUID_constref productID) = 0;  // 3
+                               aafUID_constref productID) = 0;                         // 3
     virtual HRESULT GetCompanyName(aafCharacter* companyName, aafUInt32 bufSize) = 0;  // 4
-    virtual HRESULT GetCompanyNameBufLen(aafUInt32* bufSize) = 0;  // 5
+    virtual HRESULT GetCompanyNameBufLen(aafUInt32* bufSize) = 0;                      // 5
     virtual HRESULT GetProductName(aafCharacter* productName, aafUInt32 bufSize) = 0;  // 6
-    virtual HRESULT GetProductNameBufLen(aafUInt32* bufSize) = 0;  // 7
+    virtual HRESULT GetProductNameBufLen(aafUInt32* bufSize) = 0;                      // 7
     virtual HRESULT GetProductVersionString(aafCharacter* productVersionString,
-                                            aafUInt32 bufSize) = 0;  // 8
-    virtual HRESULT GetProductVersionStringBufLen(aafUInt32* bufSize) = 0;  // 9
-    virtual HRESULT GetProductVersion(aafProductVersion_t* version) = 0;  // 10
-    virtual HRESULT SetProductVersion(aafProductVersion_constref version) = 0;  // 11
-    virtual HRESULT GetProductID(aafUID_t* productID) = 0;  // 12
-    virtual HRESULT GetDate(aafTimeStamp_t* timestamp) = 0;  // 13
-    virtual HRESULT GetRefImplVersion(aafProductVersion_t* version) = 0;  // 14
+                                            aafUInt32 bufSize) = 0;              // 8
+    virtual HRESULT GetProductVersionStringBufLen(aafUInt32* bufSize) = 0;       // 9
+    virtual HRESULT GetProductVersion(aafProductVersion_t* version) = 0;         // 10
+    virtual HRESULT SetProductVersion(aafProductVersion_constref version) = 0;   // 11
+    virtual HRESULT GetProductID(aafUID_t* productID) = 0;                       // 12
+    virtual HRESULT GetDate(aafTimeStamp_t* timestamp) = 0;                      // 13
+    virtual HRESULT GetRefImplVersion(aafProductVersion_t* version) = 0;         // 14
     virtual HRESULT GetPlatform(aafCharacter* platform, aafUInt32 bufSize) = 0;  // 15
-    virtual HRESULT GetPlatformBufLen(aafUInt32* bufSize) = 0;  // 16
-    virtual HRESULT GetGenerationID(aafUID_t* generation) = 0;  // 17
+    virtual HRESULT GetPlatformBufLen(aafUInt32* bufSize) = 0;                   // 16
+    virtual HRESULT GetGenerationID(aafUID_t* generation) = 0;                   // 17
 
 protected:
     ~IAAFIdentification() = default;
@@ -193,9 +192,9 @@ constexpr const GUID& aafIdOf(const IAAFIdentification*) {
 struct IEnumAAFIdentifications : IUnknown {
     virtual HRESULT NextOne(IAAFIdentification** identification) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFIdentification** identifications,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;                  // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                        // 5
+    virtual HRESULT Reset() = 0;                                      // 6
     virtual HRESULT Clone(IEnumAAFIdentifications** enumerator) = 0;  // 7
 
 protected:
@@ -224,8 +223,8 @@ constexpr const GUID& aafIdOf(const IAAFEndian*) {
 // Answered by AAFCachePageAllocator.
 struct IAAFCachePageAllocator : IUnknown {
     virtual HRESULT Initialize(aafUInt32 pageCount, aafUInt32 pageSize) = 0;  // 3
-    virtual HRESULT Allocate(aafMemPtr_t* page) = 0;  // 4
-    virtual HRESULT Deallocate(aafMemPtr_t page) = 0;  // 5
+    virtual HRESULT Allocate(aafMemPtr_t* page) = 0;                          // 4
+    virtual HRESULT Deallocate(aafMemPtr_t page) = 0;                         // 5
 
 protected:
     ~IAAFCachePageAllocator() = default;
@@ -251,11 +250,11 @@ constexpr const GUID& aafIdOf(const IAAFDiagnosticOutput*) {
 
 // Answered by AAFFileEncoding.
 struct IAAFFileEncoding : IUnknown {
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 3
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 4
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;                // 3
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                             // 4
     virtual HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) = 0;  // 5
-    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;  // 6
-    virtual HRESULT GetFileKind(aafUID_t* fileKind) = 0;  // 7
+    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;                      // 6
+    virtual HRESULT GetFileKind(aafUID_t* fileKind) = 0;                               // 7
 
 protected:
     ~IAAFFileEncoding() = default;
@@ -269,7 +268,7 @@ constexpr const GUID& aafIdOf(const IAAFFileEncoding*) {
 // Answered by AAFGetFileBits.
 struct IAAFGetFileBits : IUnknown {
     virtual HRESULT ReadAt(aafMemPtr_t buf, aafUInt32 bufSize, aafUInt64 position) = 0;  // 3
-    virtual HRESULT GetSize(aafUInt64* size) = 0;  // 4
+    virtual HRESULT GetSize(aafUInt64* size) = 0;                                        // 4
 
 protected:
     ~IAAFGetFileBits() = default;
@@ -296,8 +295,8 @@ constexpr const GUID& aafIdOf(const IAAFProgress*) {
 // Answered by AAFRandomFile.
 struct IAAFRandomFile : IUnknown {
     virtual HRESULT GetFileBits(IAAFGetFileBits** getFileBits) = 0;  // 3
-    virtual HRESULT Revert() = 0;  // 4
-    virtual HRESULT SaveAsFile(IAAFFile* destFile) = 0;  // 5
+    virtual HRESULT Revert() = 0;                                    // 4
+    virtual HRESULT SaveAsFile(IAAFFile* destFile) = 0;              // 5
     virtual HRESULT SetFileBits(IAAFSetFileBits** setFileBits) = 0;  // 6
 
 protected:
@@ -314,11 +313,11 @@ struct IAAFRandomRawStorage : IUnknown {
     virtual HRESULT ReadAt(aafUInt64 position, aafMemPtr_t buf, aafUInt32 bufSize,
                            aafUInt32* numRead) = 0;  // 3
     virtual HRESULT WriteAt(aafUInt64 position, aafMemConstPtr_t buf, aafUInt32 bufSize,
-                            aafUInt32* numWritten) = 0;  // 4
-    virtual HRESULT GetSize(aafUInt64* size) = 0;  // 5
+                            aafUInt32* numWritten) = 0;      // 4
+    virtual HRESULT GetSize(aafUInt64* size) = 0;            // 5
     virtual HRESULT IsExtendable(aafBoolean_t* result) = 0;  // 6
-    virtual HRESULT GetExtent(aafUInt64* extent) = 0;  // 7
-    virtual HRESULT SetExtent(aafUInt64 extent) = 0;  // 8
+    virtual HRESULT GetExtent(aafUInt64* extent) = 0;        // 7
+    virtual HRESULT SetExtent(aafUInt64 extent) = 0;         // 8
 
 protected:
     ~IAAFRandomRawStorage() = default;
@@ -331,11 +330,11 @@ constexpr const GUID& aafIdOf(const IAAFRandomRawStorage*) {
 
 // Answered by AAFRawStorage.
 struct IAAFRawStorage : IUnknown {
-    virtual HRESULT IsReadable(aafBoolean_t* result) = 0;  // 3
-    virtual HRESULT Read(aafMemPtr_t buf, aafUInt32 bufSize, aafUInt32* numRead) = 0;  // 4
-    virtual HRESULT IsWriteable(aafBoolean_t* result) = 0;  // 5
+    virtual HRESULT IsReadable(aafBoolean_t* result) = 0;                                       // 3
+    virtual HRESULT Read(aafMemPtr_t buf, aafUInt32 bufSize, aafUInt32* numRead) = 0;           // 4
+    virtual HRESULT IsWriteable(aafBoolean_t* result) = 0;                                      // 5
     virtual HRESULT Write(aafMemConstPtr_t buf, aafUInt32 bufSize, aafUInt32* numWritten) = 0;  // 6
-    virtual HRESULT Synchronize() = 0;  // 7
+    virtual HRESULT Synchronize() = 0;                                                          // 7
 
 protected:
     ~IAAFRawStorage() = default;
@@ -349,7 +348,7 @@ constexpr const GUID& aafIdOf(const IAAFRawStorage*) {
 // Answered by AAFSetFileBits.
 struct IAAFSetFileBits : IUnknown {
     virtual HRESULT WriteAt(aafMemPtr_t buf, aafUInt32 bufSize, aafUInt64 position) = 0;  // 3
-    virtual HRESULT SetSize(aafUInt64 size) = 0;  // 4
+    virtual HRESULT SetSize(aafUInt64 size) = 0;                                          // 4
 
 protected:
     ~IAAFSetFileBits() = default;
@@ -364,9 +363,9 @@ constexpr const GUID& aafIdOf(const IAAFSetFileBits*) {
 struct IEnumAAFFileEncodings : IUnknown {
     virtual HRESULT NextOne(IAAFFileEncoding** fileEncodings) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFFileEncoding** fileEncodings,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;                // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                      // 5
+    virtual HRESULT Reset() = 0;                                    // 6
     virtual HRESULT Clone(IEnumAAFFileEncodings** enumerator) = 0;  // 7
 
 protected:

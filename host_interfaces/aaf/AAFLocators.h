@@ -11,9 +11,9 @@ struct IEnumAAFLocators;
 
 // Answered by AAFLocator.
 struct IAAFLocator : IUnknown {
-    virtual HRESULT SetPath(aafCharacter_constptr path) = 0;  // 3
+    virtual HRESULT SetPath(aafCharacter_constptr path) = 0;             // 3
     virtual HRESULT GetPath(aafCharacter* path, aafUInt32 bufSize) = 0;  // 4
-    virtual HRESULT GetPathBufLen(aafUInt32* bufSize) = 0;  // 5
+    virtual HRESULT GetPathBufLen(aafUInt32* bufSize) = 0;               // 5
 
 protected:
     ~IAAFLocator() = default;
@@ -39,10 +39,10 @@ constexpr const GUID& aafIdOf(const IAAFNetworkLocator*) {
 
 // Answered by AAFTextLocator.
 struct IAAFTextLocator : IUnknown {
-    virtual HRESULT Initialize() = 0;  // 3
-    virtual HRESULT SetName(aafCharacter_constptr name) = 0;  // 4
+    virtual HRESULT Initialize() = 0;                                    // 3
+    virtual HRESULT SetName(aafCharacter_constptr name) = 0;             // 4
     virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 5
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 6
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;               // 6
 
 protected:
     ~IAAFTextLocator() = default;
@@ -55,11 +55,11 @@ constexpr const GUID& aafIdOf(const IAAFTextLocator*) {
 
 // Answered by EnumAAFLocators.
 struct IEnumAAFLocators : IUnknown {
-    virtual HRESULT NextOne(IAAFLocator** locator) = 0;  // 3
+    virtual HRESULT NextOne(IAAFLocator** locator) = 0;                                     // 3
     virtual HRESULT Next(aafUInt32 count, IAAFLocator** locators, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFLocators** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                              // 5
+    virtual HRESULT Reset() = 0;                                                            // 6
+    virtual HRESULT Clone(IEnumAAFLocators** enumerator) = 0;                               // 7
 
 protected:
     ~IEnumAAFLocators() = default;

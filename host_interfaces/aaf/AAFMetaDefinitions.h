@@ -21,25 +21,25 @@ struct IEnumAAFTypeDefs;
 struct IAAFClassDef : IUnknown {
     virtual HRESULT Initialize(aafUID_constref classID, IAAFClassDef* parentClass,
                                aafCharacter_constptr className,
-                               aafBoolean_t isConcrete) = 0;  // 3
+                               aafBoolean_t isConcrete) = 0;                 // 3
     virtual HRESULT GetPropertyDefs(IEnumAAFPropertyDefs** enumerator) = 0;  // 4
-    virtual HRESULT CountPropertyDefs(aafUInt32* count) = 0;  // 5
+    virtual HRESULT CountPropertyDefs(aafUInt32* count) = 0;                 // 5
     virtual HRESULT RegisterNewPropertyDef(aafUID_constref id, aafCharacter_constptr name,
                                            IAAFTypeDef* typeDef, aafBoolean_t isOptional,
                                            aafBoolean_t isUniqueIdentifier,
                                            IAAFPropertyDef** propDef) = 0;  // 6
     virtual HRESULT RegisterOptionalPropertyDef(aafUID_constref id, aafCharacter_constptr name,
                                                 IAAFTypeDef* typeDef,
-                                                IAAFPropertyDef** propDef) = 0;  // 7
+                                                IAAFPropertyDef** propDef) = 0;                // 7
     virtual HRESULT LookupPropertyDef(aafUID_constref propID, IAAFPropertyDef** propDef) = 0;  // 8
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 9
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 10
-    virtual HRESULT GetParent(IAAFClassDef** classDef) = 0;  // 11
-    virtual HRESULT IsConcrete(aafBoolean_t* result) = 0;  // 12
-    virtual HRESULT IsRoot(aafBoolean_t* isRoot) = 0;  // 13
-    virtual HRESULT IsUniquelyIdentified(aafBoolean_t* isUniquelyIdentified) = 0;  // 14
-    virtual HRESULT GetUniqueIdentifier(IAAFPropertyDef** uniqueIdentifier) = 0;  // 15
-    virtual HRESULT CreateInstance(REFIID riid, IUnknown** object) = 0;  // 16
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;                        // 9
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                                     // 10
+    virtual HRESULT GetParent(IAAFClassDef** classDef) = 0;                                    // 11
+    virtual HRESULT IsConcrete(aafBoolean_t* result) = 0;                                      // 12
+    virtual HRESULT IsRoot(aafBoolean_t* isRoot) = 0;                                          // 13
+    virtual HRESULT IsUniquelyIdentified(aafBoolean_t* isUniquelyIdentified) = 0;              // 14
+    virtual HRESULT GetUniqueIdentifier(IAAFPropertyDef** uniqueIdentifier) = 0;               // 15
+    virtual HRESULT CreateInstance(REFIID riid, IUnknown** object) = 0;                        // 16
 
 protected:
     ~IAAFClassDef() = default;
@@ -53,14 +53,14 @@ constexpr const GUID& aafIdOf(const IAAFClassDef*) {
 // Answered by AAFMetaDefinition.
 struct IAAFMetaDefinition : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-    virtual HRESULT GetAUID(aafUID_t* auid) = 0;  // 4
-    virtual HRESULT SetName(aafCharacter_constptr name) = 0;  // 5
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 6
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 7
-    virtual HRESULT SetDescription(aafCharacter_constptr description) = 0;  // 8
+                               aafCharacter_constptr description) = 0;                 // 3
+    virtual HRESULT GetAUID(aafUID_t* auid) = 0;                                       // 4
+    virtual HRESULT SetName(aafCharacter_constptr name) = 0;                           // 5
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;                // 6
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                             // 7
+    virtual HRESULT SetDescription(aafCharacter_constptr description) = 0;             // 8
     virtual HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) = 0;  // 9
-    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;  // 10
+    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;                      // 10
 
 protected:
     ~IAAFMetaDefinition() = default;
@@ -73,14 +73,14 @@ constexpr const GUID& aafIdOf(const IAAFMetaDefinition*) {
 
 // Answered by AAFPropertyDef.
 struct IAAFPropertyDef : IUnknown {
-    virtual HRESULT GetTypeDef(IAAFTypeDef** typeDef) = 0;  // 3
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 4
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 5
-    virtual HRESULT GetIsOptional(aafBoolean_t* isOptional) = 0;  // 6
-    virtual HRESULT GetIsUniqueIdentifier(aafBoolean_t* isUniqueIdentifier) = 0;  // 7
-    virtual HRESULT SetDescription(aafCharacter_constptr description) = 0;  // 8
+    virtual HRESULT GetTypeDef(IAAFTypeDef** typeDef) = 0;                             // 3
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;                // 4
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                             // 5
+    virtual HRESULT GetIsOptional(aafBoolean_t* isOptional) = 0;                       // 6
+    virtual HRESULT GetIsUniqueIdentifier(aafBoolean_t* isUniqueIdentifier) = 0;       // 7
+    virtual HRESULT SetDescription(aafCharacter_constptr description) = 0;             // 8
     virtual HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) = 0;  // 9
-    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;  // 10
+    virtual HRESULT GetDescriptionBufLen(aafUInt32* bufSize) = 0;                      // 10
 
 protected:
     ~IAAFPropertyDef() = default;
@@ -94,7 +94,7 @@ constexpr const GUID& aafIdOf(const IAAFPropertyDef*) {
 // Answered by AAFTypeDef.
 struct IAAFTypeDef : IUnknown {
     virtual HRESULT GetTypeCategory(eAAFTypeCategory_t* tid) = 0;  // 3
-    virtual HRESULT RawAccessType(IAAFTypeDef** rawTypeDef) = 0;  // 4
+    virtual HRESULT RawAccessType(IAAFTypeDef** rawTypeDef) = 0;   // 4
 
 protected:
     ~IAAFTypeDef() = default;
@@ -114,8 +114,8 @@ struct IAAFTypeDefInt : IUnknown {
     virtual HRESULT GetInteger(IAAFPropertyValue* propVal, aafMemPtr_t val,
                                aafUInt32 valSize) = 0;  // 5
     virtual HRESULT SetInteger(IAAFPropertyValue* propVal, aafMemPtr_t val,
-                               aafUInt32 valSize) = 0;  // 6
-    virtual HRESULT GetSize(aafUInt32* size) = 0;  // 7
+                               aafUInt32 valSize) = 0;     // 6
+    virtual HRESULT GetSize(aafUInt32* size) = 0;          // 7
     virtual HRESULT IsSigned(aafBoolean_t* isSigned) = 0;  // 8
 
 protected:
@@ -131,10 +131,10 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefInt*) {
 struct IAAFTypeDefRecord : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, IAAFTypeDef** memberTypes,
                                aafString_t* memberNames, aafUInt32 numMembers,
-                               aafCharacter_constptr typeName) = 0;  // 3
-    virtual HRESULT GetMemberType(aafUInt32 index, IAAFTypeDef** typeDef) = 0;  // 4
+                               aafCharacter_constptr typeName) = 0;                             // 3
+    virtual HRESULT GetMemberType(aafUInt32 index, IAAFTypeDef** typeDef) = 0;                  // 4
     virtual HRESULT GetMemberName(aafUInt32 index, aafCharacter* name, aafUInt32 bufSize) = 0;  // 5
-    virtual HRESULT GetMemberNameBufLen(aafUInt32 index, aafUInt32* len) = 0;  // 6
+    virtual HRESULT GetMemberNameBufLen(aafUInt32 index, aafUInt32* len) = 0;                   // 6
     virtual HRESULT CreateValueFromValues(IAAFPropertyValue** memberValues, aafUInt32 numMembers,
                                           IAAFPropertyValue** propVal) = 0;  // 7
     virtual HRESULT CreateValueFromStruct(aafMemPtr_t initData, aafUInt32 initDataSize,
@@ -147,7 +147,7 @@ struct IAAFTypeDefRecord : IUnknown {
                              IAAFPropertyValue* memberPropVal) = 0;  // 11
     virtual HRESULT SetStruct(IAAFPropertyValue* propVal, aafMemPtr_t data,
                               aafUInt32 dataSize) = 0;  // 12
-    virtual HRESULT GetCount(aafUInt32* count) = 0;  // 13
+    virtual HRESULT GetCount(aafUInt32* count) = 0;     // 13
     virtual HRESULT RegisterMembers(aafUInt32* offsets, aafUInt32 numMembers,
                                     aafUInt32 structSize) = 0;  // 14
 
@@ -163,14 +163,13 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefRecord*) {
 // Answered by AAFTypeDefVariableArray.
 struct IAAFTypeDefVariableArray : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, IAAFTypeDef* typeDef,
-                               aafCharacter_constptr typeName) = 0;  // 3
-    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;  // 4
+                               aafCharacter_constptr typeName) = 0;              // 3
+    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;                          // 4
     virtual HRESULT GetCount(IAAFPropertyValue* propVal, aafUInt32* count) = 0;  // 5
     virtual HRESULT AppendElement(IAAFPropertyValue* inPropVal,
                                   IAAFPropertyValue* memberPropVal) = 0;  // 6
-    virtual HRESULT CreateEmptyValue(IAAFPropertyValue** propVal) = 0;  // 7
-    virtual HRESULT CreateValueFromValues(IAAFPropertyValue** elementValues,
-                                          aafUInt32 numElements,
+    virtual HRESULT CreateEmptyValue(IAAFPropertyValue** propVal) = 0;    // 7
+    virtual HRESULT CreateValueFromValues(IAAFPropertyValue** elementValues, aafUInt32 numElements,
                                           IAAFPropertyValue** propVal) = 0;  // 8
     virtual HRESULT CreateValueFromCArray(aafMemPtr_t initData, aafUInt32 initDataSize,
                                           IAAFPropertyValue** propVal) = 0;  // 9
@@ -189,7 +188,8 @@ protected:
     ~IAAFTypeDefVariableArray() = default;
 };
 
-inline constexpr GUID IID_IAAFTypeDefVariableArray = ncfGuid("307E9E66-DCB2-11D2-8429-00600832ACB8");
+inline constexpr GUID IID_IAAFTypeDefVariableArray =
+    ncfGuid("307E9E66-DCB2-11D2-8429-00600832ACB8");
 constexpr const GUID& aafIdOf(const IAAFTypeDefVariableArray*) {
     return IID_IAAFTypeDefVariableArray;
 }
@@ -197,7 +197,7 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefVariableArray*) {
 // Answered by AAFTypeDefVariableArray.
 struct IAAFTypeDefVariableArrayEx : IUnknown {
     virtual HRESULT PrependElement(IAAFPropertyValue* inPropVal,
-                                   IAAFPropertyValue* memberPropVal) = 0;  // 3
+                                   IAAFPropertyValue* memberPropVal) = 0;              // 3
     virtual HRESULT RemoveElement(IAAFPropertyValue* inPropVal, aafUInt32 index) = 0;  // 4
     virtual HRESULT InsertElement(IAAFPropertyValue* inPropVal, aafUInt32 index,
                                   IAAFPropertyValue* memberPropVal) = 0;  // 5
@@ -206,17 +206,18 @@ protected:
     ~IAAFTypeDefVariableArrayEx() = default;
 };
 
-inline constexpr GUID IID_IAAFTypeDefVariableArrayEx = ncfGuid("7F73D4B3-6F9A-11D4-8E59-009027DFCC26");
+inline constexpr GUID IID_IAAFTypeDefVariableArrayEx =
+    ncfGuid("7F73D4B3-6F9A-11D4-8E59-009027DFCC26");
 constexpr const GUID& aafIdOf(const IAAFTypeDefVariableArrayEx*) {
     return IID_IAAFTypeDefVariableArrayEx;
 }
 
 // Answered by AAFTypeDefObjectRef.
 struct IAAFTypeDefObjectRef : IUnknown {
-    virtual HRESULT GetObjectType(IAAFClassDef** objType) = 0;  // 3
-    virtual HRESULT CreateValue(IUnknown* obj, IAAFPropertyValue** propVal) = 0;  // 4
+    virtual HRESULT GetObjectType(IAAFClassDef** objType) = 0;                                 // 3
+    virtual HRESULT CreateValue(IUnknown* obj, IAAFPropertyValue** propVal) = 0;               // 4
     virtual HRESULT GetObject(IAAFPropertyValue* propVal, REFIID iid, IUnknown** object) = 0;  // 5
-    virtual HRESULT SetObject(IAAFPropertyValue* propVal, IUnknown* object) = 0;  // 6
+    virtual HRESULT SetObject(IAAFPropertyValue* propVal, IUnknown* object) = 0;               // 6
 
 protected:
     ~IAAFTypeDefObjectRef() = default;
@@ -230,13 +231,13 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefObjectRef*) {
 // Answered by AAFTypeDefString.
 struct IAAFTypeDefString : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, IAAFTypeDef* typeDef,
-                               aafCharacter_constptr typeName) = 0;  // 3
-    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;  // 4
+                               aafCharacter_constptr typeName) = 0;              // 3
+    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;                          // 4
     virtual HRESULT GetCount(IAAFPropertyValue* propVal, aafUInt32* count) = 0;  // 5
     virtual HRESULT CreateValueFromCString(aafMemPtr_t initData, aafUInt32 initDataSize,
                                            IAAFPropertyValue** propVal) = 0;  // 6
     virtual HRESULT SetCString(IAAFPropertyValue* propVal, aafMemPtr_t data,
-                               aafUInt32 dataSize) = 0;  // 7
+                               aafUInt32 dataSize) = 0;                                      // 7
     virtual HRESULT AppendElements(IAAFPropertyValue* inPropVal, aafMemPtr_t elements) = 0;  // 8
     virtual HRESULT GetElements(IAAFPropertyValue* inPropVal, aafMemPtr_t buffer,
                                 aafUInt32 bufferSize) = 0;  // 9
@@ -256,22 +257,22 @@ struct IAAFTypeDefEnum : IUnknown {
                                aafString_t* elementNames, aafUInt32 numElems,
                                aafCharacter_constptr typeName) = 0;  // 3
     virtual HRESULT CreateValueFromName(aafCharacter_constptr name,
-                                        IAAFPropertyValue** propVal) = 0;  // 4
-    virtual HRESULT GetElementType(IAAFTypeDef** typeDef) = 0;  // 5
+                                        IAAFPropertyValue** propVal) = 0;      // 4
+    virtual HRESULT GetElementType(IAAFTypeDef** typeDef) = 0;                 // 5
     virtual HRESULT GetElementValue(aafUInt32 index, aafInt64* outValue) = 0;  // 6
     virtual HRESULT GetElementName(aafUInt32 index, aafCharacter* outValue,
-                                   aafUInt32 bufSize) = 0;  // 7
+                                   aafUInt32 bufSize) = 0;                      // 7
     virtual HRESULT GetElementNameBufLen(aafUInt32 index, aafUInt32* len) = 0;  // 8
-    virtual HRESULT CountElements(aafUInt32* count) = 0;  // 9
+    virtual HRESULT CountElements(aafUInt32* count) = 0;                        // 9
     virtual HRESULT GetNameFromValue(IAAFPropertyValue* value, aafCharacter* name,
-                                     aafUInt32 bufSize) = 0;  // 10
+                                     aafUInt32 bufSize) = 0;                               // 10
     virtual HRESULT GetNameBufLenFromValue(IAAFPropertyValue* value, aafUInt32* len) = 0;  // 11
     virtual HRESULT GetNameFromInteger(aafInt64 value, aafCharacter* name,
-                                       aafUInt32 bufSize) = 0;  // 12
-    virtual HRESULT GetNameBufLenFromInteger(aafInt64 value, aafUInt32* len) = 0;  // 13
-    virtual HRESULT GetIntegerValue(IAAFPropertyValue* propValIn, aafInt64* valueOut) = 0;  // 14
+                                       aafUInt32 bufSize) = 0;                               // 12
+    virtual HRESULT GetNameBufLenFromInteger(aafInt64 value, aafUInt32* len) = 0;            // 13
+    virtual HRESULT GetIntegerValue(IAAFPropertyValue* propValIn, aafInt64* valueOut) = 0;   // 14
     virtual HRESULT SetIntegerValue(IAAFPropertyValue* propValToSet, aafInt64 valueIn) = 0;  // 15
-    virtual HRESULT RegisterSize(aafUInt32 enumSize) = 0;  // 16
+    virtual HRESULT RegisterSize(aafUInt32 enumSize) = 0;                                    // 16
 
 protected:
     ~IAAFTypeDefEnum() = default;
@@ -286,10 +287,9 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefEnum*) {
 struct IAAFTypeDefFixedArray : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, IAAFTypeDef* typeDef, aafUInt32 nElements,
                                aafCharacter_constptr typeName) = 0;  // 3
-    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;  // 4
-    virtual HRESULT GetCount(aafUInt32* count) = 0;  // 5
-    virtual HRESULT CreateValueFromValues(IAAFPropertyValue** elementValues,
-                                          aafUInt32 numElements,
+    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;              // 4
+    virtual HRESULT GetCount(aafUInt32* count) = 0;                  // 5
+    virtual HRESULT CreateValueFromValues(IAAFPropertyValue** elementValues, aafUInt32 numElements,
                                           IAAFPropertyValue** propVal) = 0;  // 6
     virtual HRESULT CreateValueFromCArray(aafMemPtr_t initData, aafUInt32 initDataSize,
                                           IAAFPropertyValue** propVal) = 0;  // 7
@@ -317,14 +317,14 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefFixedArray*) {
 struct IAAFTypeDefSet : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, IAAFTypeDef* typeDef,
                                aafCharacter_constptr typeName) = 0;  // 3
-    virtual HRESULT GetElementType(IAAFTypeDef** typeDef) = 0;  // 4
+    virtual HRESULT GetElementType(IAAFTypeDef** typeDef) = 0;       // 4
     virtual HRESULT AddElement(IAAFPropertyValue* setPropertyValue,
                                IAAFPropertyValue* elementPropertyValue) = 0;  // 5
     virtual HRESULT RemoveElement(IAAFPropertyValue* setPropertyValue,
                                   IAAFPropertyValue* elementPropertyValue) = 0;  // 6
     virtual HRESULT ContainsElement(IAAFPropertyValue* setPropertyValue,
                                     IAAFPropertyValue* elementPropertyValue,
-                                    aafBoolean_t* containsElement) = 0;  // 7
+                                    aafBoolean_t* containsElement) = 0;                   // 7
     virtual HRESULT GetCount(IAAFPropertyValue* setPropertyValue, aafUInt32* count) = 0;  // 8
     virtual HRESULT CreateKey(aafDataBuffer_t keyPtr, aafUInt32 length,
                               IAAFPropertyValue** key) = 0;  // 9
@@ -377,7 +377,7 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefWeakObjRef*) {
 struct IAAFTypeDefRename : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, IAAFTypeDef* baseType,
                                aafCharacter_constptr typeName) = 0;  // 3
-    virtual HRESULT GetBaseType(IAAFTypeDef** baseType) = 0;  // 4
+    virtual HRESULT GetBaseType(IAAFTypeDef** baseType) = 0;         // 4
     virtual HRESULT GetBaseValue(IAAFPropertyValue* inPropVal,
                                  IAAFPropertyValue** outPropVal) = 0;  // 5
     virtual HRESULT CreateValue(IAAFPropertyValue* inPropVal,
@@ -396,21 +396,21 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefRename*) {
 struct IAAFTypeDefExtEnum : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr typeName) = 0;  // 3
     virtual HRESULT CreateValueFromName(aafCharacter_constptr name,
-                                        IAAFPropertyValue** propVal) = 0;  // 4
-    virtual HRESULT CountElements(aafUInt32* count) = 0;  // 5
+                                        IAAFPropertyValue** propVal) = 0;      // 4
+    virtual HRESULT CountElements(aafUInt32* count) = 0;                       // 5
     virtual HRESULT GetElementValue(aafUInt32 index, aafUID_t* outValue) = 0;  // 6
     virtual HRESULT GetElementName(aafUInt32 index, aafCharacter* outValue,
-                                   aafUInt32 bufSize) = 0;  // 7
+                                   aafUInt32 bufSize) = 0;                      // 7
     virtual HRESULT GetElementNameBufLen(aafUInt32 index, aafUInt32* len) = 0;  // 8
     virtual HRESULT GetNameFromValue(IAAFPropertyValue* value, aafCharacter* name,
-                                     aafUInt32 bufSize) = 0;  // 9
+                                     aafUInt32 bufSize) = 0;                               // 9
     virtual HRESULT GetNameBufLenFromValue(IAAFPropertyValue* value, aafUInt32* len) = 0;  // 10
     virtual HRESULT GetNameFromAUID(aafUID_constref value, aafCharacter* name,
-                                    aafUInt32 bufSize) = 0;  // 11
-    virtual HRESULT GetNameBufLenFromAUID(aafUID_constref value, aafUInt32* len) = 0;  // 12
+                                    aafUInt32 bufSize) = 0;                              // 11
+    virtual HRESULT GetNameBufLenFromAUID(aafUID_constref value, aafUInt32* len) = 0;    // 12
     virtual HRESULT GetAUIDValue(IAAFPropertyValue* propValIn, aafUID_t* valueOut) = 0;  // 13
     virtual HRESULT SetAUIDValue(IAAFPropertyValue* propValToSet,
-                                 aafUID_constref valueIn) = 0;  // 14
+                                 aafUID_constref valueIn) = 0;                             // 14
     virtual HRESULT AppendElement(aafUID_constref value, aafCharacter_constptr name) = 0;  // 15
 
 protected:
@@ -452,7 +452,7 @@ struct IAAFTypeDefOpaque : IUnknown {
     virtual HRESULT GetActualTypeID(IAAFPropertyValue* opaquePropertyValue,
                                     aafUID_t* actualTypeID) = 0;  // 3
     virtual HRESULT GetHandle(IAAFPropertyValue* propVal, aafUInt32 handleSize,
-                              aafDataBuffer_t handle, aafUInt32* bytesRead) = 0;  // 4
+                              aafDataBuffer_t handle, aafUInt32* bytesRead) = 0;      // 4
     virtual HRESULT GetHandleBufLen(IAAFPropertyValue* propVal, aafUInt32* len) = 0;  // 5
     virtual HRESULT SetHandle(IAAFPropertyValue* propVal, aafUInt32 handleSize,
                               aafDataBuffer_t handle) = 0;  // 6
@@ -488,7 +488,7 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefCharacter*) {
 
 // Answered by AAFTypeDefStream.
 struct IAAFTypeDefStream : IUnknown {
-    virtual HRESULT GetSize(IAAFPropertyValue* streamPropertyValue, aafInt64* size) = 0;  // 3
+    virtual HRESULT GetSize(IAAFPropertyValue* streamPropertyValue, aafInt64* size) = 0;    // 3
     virtual HRESULT SetSize(IAAFPropertyValue* streamPropertyValue, aafInt64 newSize) = 0;  // 4
     virtual HRESULT GetPosition(IAAFPropertyValue* streamPropertyValue,
                                 aafInt64* position) = 0;  // 5
@@ -505,16 +505,16 @@ struct IAAFTypeDefStream : IUnknown {
     virtual HRESULT GetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
                                        eAAFByteOrder_t* byteOrder) = 0;  // 11
     virtual HRESULT SetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
-                                       eAAFByteOrder_t byteOrder) = 0;  // 12
+                                       eAAFByteOrder_t byteOrder) = 0;                 // 12
     virtual HRESULT ClearStoredByteOrder(IAAFPropertyValue* streamPropertyValue) = 0;  // 13
     virtual HRESULT ReadElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
                                  aafUInt32 dataSize, aafMemPtr_t data,
                                  aafUInt32* bytesRead) = 0;  // 14
-    virtual HRESULT WriteElements(IAAFPropertyValue* streamPropertyValue,
-                                  IAAFTypeDef* elementType, aafUInt32 dataSize,
+    virtual HRESULT WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                  aafUInt32 dataSize,
                                   aafMemPtr_t data) = 0;  // 15
-    virtual HRESULT AppendElements(IAAFPropertyValue* streamPropertyValue,
-                                   IAAFTypeDef* elementType, aafUInt32 dataSize,
+    virtual HRESULT AppendElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                   aafUInt32 dataSize,
                                    aafMemPtr_t data) = 0;  // 16
 
 protected:
@@ -542,7 +542,7 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefStreamEx*) {
 
 // Answered by AAFTypeDefStream.
 struct IAAFTypeDefStream3 : IUnknown {
-    virtual HRESULT GetSize(IAAFPropertyValue* streamPropertyValue, aafInt64* size) = 0;  // 3
+    virtual HRESULT GetSize(IAAFPropertyValue* streamPropertyValue, aafInt64* size) = 0;    // 3
     virtual HRESULT SetSize(IAAFPropertyValue* streamPropertyValue, aafInt64 newSize) = 0;  // 4
     virtual HRESULT GetPosition(IAAFPropertyValue* streamPropertyValue,
                                 aafInt64* position) = 0;  // 5
@@ -559,16 +559,16 @@ struct IAAFTypeDefStream3 : IUnknown {
     virtual HRESULT GetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
                                        eAAFByteOrder_t* byteOrder) = 0;  // 11
     virtual HRESULT SetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
-                                       eAAFByteOrder_t byteOrder) = 0;  // 12
+                                       eAAFByteOrder_t byteOrder) = 0;                 // 12
     virtual HRESULT ClearStoredByteOrder(IAAFPropertyValue* streamPropertyValue) = 0;  // 13
     virtual HRESULT ReadElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
                                  aafUInt32 dataSize, aafMemPtr_t data,
                                  aafUInt32* bytesRead) = 0;  // 14
-    virtual HRESULT WriteElements(IAAFPropertyValue* streamPropertyValue,
-                                  IAAFTypeDef* elementType, aafUInt32 dataSize,
+    virtual HRESULT WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                  aafUInt32 dataSize,
                                   aafMemPtr_t data) = 0;  // 15
-    virtual HRESULT AppendElements(IAAFPropertyValue* streamPropertyValue,
-                                   IAAFTypeDef* elementType, aafUInt32 dataSize,
+    virtual HRESULT AppendElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                   aafUInt32 dataSize,
                                    aafMemPtr_t data) = 0;  // 16
     virtual HRESULT SetCallback(IAAFPropertyValue* propertyValue, IAAFStreamAccess* callbackIF,
                                 aafMemPtr_t userData) = 0;  // 17
@@ -588,9 +588,9 @@ constexpr const GUID& aafIdOf(const IAAFTypeDefStream3*) {
 struct IEnumAAFPropertyDefs : IUnknown {
     virtual HRESULT NextOne(IAAFPropertyDef** propertyDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFPropertyDef** propertyDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;               // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                     // 5
+    virtual HRESULT Reset() = 0;                                   // 6
     virtual HRESULT Clone(IEnumAAFPropertyDefs** enumerator) = 0;  // 7
 
 protected:
@@ -606,9 +606,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFPropertyDefs*) {
 struct IEnumAAFClassDefs : IUnknown {
     virtual HRESULT NextOne(IAAFClassDef** classDefs) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFClassDef** classDefs,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;            // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                  // 5
+    virtual HRESULT Reset() = 0;                                // 6
     virtual HRESULT Clone(IEnumAAFClassDefs** enumerator) = 0;  // 7
 
 protected:
@@ -622,11 +622,11 @@ constexpr const GUID& aafIdOf(const IEnumAAFClassDefs*) {
 
 // Answered by EnumAAFTypeDefs.
 struct IEnumAAFTypeDefs : IUnknown {
-    virtual HRESULT NextOne(IAAFTypeDef** typeDefs) = 0;  // 3
+    virtual HRESULT NextOne(IAAFTypeDef** typeDefs) = 0;                                       // 3
     virtual HRESULT Next(aafUInt32 count, IAAFTypeDef** typeDefs, aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFTypeDefs** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                 // 5
+    virtual HRESULT Reset() = 0;                                                               // 6
+    virtual HRESULT Clone(IEnumAAFTypeDefs** enumerator) = 0;                                  // 7
 
 protected:
     ~IEnumAAFTypeDefs() = default;

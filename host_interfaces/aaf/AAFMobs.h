@@ -29,26 +29,26 @@ struct IEnumAAFTaggedValues;
 
 // Answered by AAFMob.
 struct IAAFMob : IUnknown {
-    virtual HRESULT GetMobID(aafMobID_t* mobID) = 0;  // 3
-    virtual HRESULT SetMobID(aafMobID_constref mobID) = 0;  // 4
-    virtual HRESULT SetName(aafCharacter_constptr name) = 0;  // 5
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 6
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 7
-    virtual HRESULT CountSlots(aafNumSlots_t* numSlots) = 0;  // 8
-    virtual HRESULT AppendSlot(IAAFMobSlot* slot) = 0;  // 9
-    virtual HRESULT PrependSlot(IAAFMobSlot* slot) = 0;  // 10
-    virtual HRESULT InsertSlotAt(aafUInt32 index, IAAFMobSlot* slot) = 0;  // 11
-    virtual HRESULT RemoveSlotAt(aafUInt32 index) = 0;  // 12
-    virtual HRESULT GetSlotAt(aafUInt32 index, IAAFMobSlot** slot) = 0;  // 13
-    virtual HRESULT GetSlots(IEnumAAFMobSlots** enumerator) = 0;  // 14
-    virtual HRESULT GetModTime(aafTimeStamp_t* lastModified) = 0;  // 15
-    virtual HRESULT SetModTime(aafTimeStamp_constref modTime) = 0;  // 16
-    virtual HRESULT GetCreateTime(aafTimeStamp_t* creationTime) = 0;  // 17
-    virtual HRESULT SetCreateTime(aafTimeStamp_constref createTime) = 0;  // 18
+    virtual HRESULT GetMobID(aafMobID_t* mobID) = 0;                                           // 3
+    virtual HRESULT SetMobID(aafMobID_constref mobID) = 0;                                     // 4
+    virtual HRESULT SetName(aafCharacter_constptr name) = 0;                                   // 5
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;                        // 6
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                                     // 7
+    virtual HRESULT CountSlots(aafNumSlots_t* numSlots) = 0;                                   // 8
+    virtual HRESULT AppendSlot(IAAFMobSlot* slot) = 0;                                         // 9
+    virtual HRESULT PrependSlot(IAAFMobSlot* slot) = 0;                                        // 10
+    virtual HRESULT InsertSlotAt(aafUInt32 index, IAAFMobSlot* slot) = 0;                      // 11
+    virtual HRESULT RemoveSlotAt(aafUInt32 index) = 0;                                         // 12
+    virtual HRESULT GetSlotAt(aafUInt32 index, IAAFMobSlot** slot) = 0;                        // 13
+    virtual HRESULT GetSlots(IEnumAAFMobSlots** enumerator) = 0;                               // 14
+    virtual HRESULT GetModTime(aafTimeStamp_t* lastModified) = 0;                              // 15
+    virtual HRESULT SetModTime(aafTimeStamp_constref modTime) = 0;                             // 16
+    virtual HRESULT GetCreateTime(aafTimeStamp_t* creationTime) = 0;                           // 17
+    virtual HRESULT SetCreateTime(aafTimeStamp_constref createTime) = 0;                       // 18
     virtual HRESULT AppendComment(aafCharacter* category, aafCharacter_constptr comment) = 0;  // 19
-    virtual HRESULT CountComments(aafUInt32* numComments) = 0;  // 20
-    virtual HRESULT GetComments(IEnumAAFTaggedValues** enumerator) = 0;  // 21
-    virtual HRESULT RemoveComment(IAAFTaggedValue* comment) = 0;  // 22
+    virtual HRESULT CountComments(aafUInt32* numComments) = 0;                                 // 20
+    virtual HRESULT GetComments(IEnumAAFTaggedValues** enumerator) = 0;                        // 21
+    virtual HRESULT RemoveComment(IAAFTaggedValue* comment) = 0;                               // 22
     virtual HRESULT AppendNewTimelineSlot(aafRational_t editRate, IAAFSegment* segment,
                                           aafSlotID_t slotID, aafCharacter_constptr slotName,
                                           aafPosition_t origin,
@@ -56,16 +56,16 @@ struct IAAFMob : IUnknown {
     virtual HRESULT GetMobInfo(aafTimeStamp_t* lastModified, aafTimeStamp_t* creationTime,
                                aafCharacter* name, aafInt32 bufSize) = 0;  // 24
     virtual HRESULT OffsetToMobTimecode(IAAFSegment* tcSeg, aafPosition_t* offset,
-                                        aafTimecode_t* result) = 0;  // 25
-    virtual HRESULT LookupSlot(aafSlotID_t slotId, IAAFMobSlot** destSlot) = 0;  // 26
+                                        aafTimecode_t* result) = 0;                         // 25
+    virtual HRESULT LookupSlot(aafSlotID_t slotId, IAAFMobSlot** destSlot) = 0;             // 26
     virtual HRESULT ChangeRef(aafMobID_constref oldMobID, aafMobID_constref newMobID) = 0;  // 27
     virtual HRESULT CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includeMedia,
-                                  IAAFFile* destFile, IAAFMob** destMob) = 0;  // 28
+                                  IAAFFile* destFile, IAAFMob** destMob) = 0;        // 28
     virtual HRESULT Copy(aafCharacter_constptr destMobName, IAAFMob** destMob) = 0;  // 29
-    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;  // 30
-    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;  // 31
-    virtual HRESULT GetKLVData(IEnumAAFKLVData** enumerator) = 0;  // 32
-    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;  // 33
+    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;                            // 30
+    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;                            // 31
+    virtual HRESULT GetKLVData(IEnumAAFKLVData** enumerator) = 0;                    // 32
+    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;                            // 33
 
 protected:
     ~IAAFMob() = default;
@@ -78,26 +78,26 @@ constexpr const GUID& aafIdOf(const IAAFMob*) {
 
 // Answered by AAFMob.
 struct IAAFMob2 : IUnknown {
-    virtual HRESULT GetMobID(aafMobID_t* mobID) = 0;  // 3
-    virtual HRESULT SetMobID(aafMobID_constref mobID) = 0;  // 4
-    virtual HRESULT SetName(aafCharacter_constptr name) = 0;  // 5
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 6
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 7
-    virtual HRESULT CountSlots(aafNumSlots_t* numSlots) = 0;  // 8
-    virtual HRESULT AppendSlot(IAAFMobSlot* slot) = 0;  // 9
-    virtual HRESULT PrependSlot(IAAFMobSlot* slot) = 0;  // 10
-    virtual HRESULT InsertSlotAt(aafUInt32 index, IAAFMobSlot* slot) = 0;  // 11
-    virtual HRESULT RemoveSlotAt(aafUInt32 index) = 0;  // 12
-    virtual HRESULT GetSlotAt(aafUInt32 index, IAAFMobSlot** slot) = 0;  // 13
-    virtual HRESULT GetSlots(IEnumAAFMobSlots** enumerator) = 0;  // 14
-    virtual HRESULT GetModTime(aafTimeStamp_t* lastModified) = 0;  // 15
-    virtual HRESULT SetModTime(aafTimeStamp_constref modTime) = 0;  // 16
-    virtual HRESULT GetCreateTime(aafTimeStamp_t* creationTime) = 0;  // 17
-    virtual HRESULT SetCreateTime(aafTimeStamp_constref createTime) = 0;  // 18
+    virtual HRESULT GetMobID(aafMobID_t* mobID) = 0;                                           // 3
+    virtual HRESULT SetMobID(aafMobID_constref mobID) = 0;                                     // 4
+    virtual HRESULT SetName(aafCharacter_constptr name) = 0;                                   // 5
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;                        // 6
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                                     // 7
+    virtual HRESULT CountSlots(aafNumSlots_t* numSlots) = 0;                                   // 8
+    virtual HRESULT AppendSlot(IAAFMobSlot* slot) = 0;                                         // 9
+    virtual HRESULT PrependSlot(IAAFMobSlot* slot) = 0;                                        // 10
+    virtual HRESULT InsertSlotAt(aafUInt32 index, IAAFMobSlot* slot) = 0;                      // 11
+    virtual HRESULT RemoveSlotAt(aafUInt32 index) = 0;                                         // 12
+    virtual HRESULT GetSlotAt(aafUInt32 index, IAAFMobSlot** slot) = 0;                        // 13
+    virtual HRESULT GetSlots(IEnumAAFMobSlots** enumerator) = 0;                               // 14
+    virtual HRESULT GetModTime(aafTimeStamp_t* lastModified) = 0;                              // 15
+    virtual HRESULT SetModTime(aafTimeStamp_constref modTime) = 0;                             // 16
+    virtual HRESULT GetCreateTime(aafTimeStamp_t* creationTime) = 0;                           // 17
+    virtual HRESULT SetCreateTime(aafTimeStamp_constref createTime) = 0;                       // 18
     virtual HRESULT AppendComment(aafCharacter* category, aafCharacter_constptr comment) = 0;  // 19
-    virtual HRESULT CountComments(aafUInt32* numComments) = 0;  // 20
-    virtual HRESULT GetComments(IEnumAAFTaggedValues** enumerator) = 0;  // 21
-    virtual HRESULT RemoveComment(IAAFTaggedValue* comment) = 0;  // 22
+    virtual HRESULT CountComments(aafUInt32* numComments) = 0;                                 // 20
+    virtual HRESULT GetComments(IEnumAAFTaggedValues** enumerator) = 0;                        // 21
+    virtual HRESULT RemoveComment(IAAFTaggedValue* comment) = 0;                               // 22
     virtual HRESULT AppendNewTimelineSlot(aafRational_t editRate, IAAFSegment* segment,
                                           aafSlotID_t slotID, aafCharacter_constptr slotName,
                                           aafPosition_t origin,
@@ -105,23 +105,23 @@ struct IAAFMob2 : IUnknown {
     virtual HRESULT GetMobInfo(aafTimeStamp_t* lastModified, aafTimeStamp_t* creationTime,
                                aafCharacter* name, aafInt32 bufSize) = 0;  // 24
     virtual HRESULT OffsetToMobTimecode(IAAFSegment* tcSeg, aafPosition_t* offset,
-                                        aafTimecode_t* result) = 0;  // 25
-    virtual HRESULT LookupSlot(aafSlotID_t slotId, IAAFMobSlot** destSlot) = 0;  // 26
+                                        aafTimecode_t* result) = 0;                         // 25
+    virtual HRESULT LookupSlot(aafSlotID_t slotId, IAAFMobSlot** destSlot) = 0;             // 26
     virtual HRESULT ChangeRef(aafMobID_constref oldMobID, aafMobID_constref newMobID) = 0;  // 27
     virtual HRESULT CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includeMedia,
-                                  IAAFFile* destFile, IAAFMob** destMob) = 0;  // 28
+                                  IAAFFile* destFile, IAAFMob** destMob) = 0;        // 28
     virtual HRESULT Copy(aafCharacter_constptr destMobName, IAAFMob** destMob) = 0;  // 29
-    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;  // 30
-    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;  // 31
-    virtual HRESULT GetKLVData(IEnumAAFKLVData** enumerator) = 0;  // 32
-    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;  // 33
+    virtual HRESULT AppendKLVData(IAAFKLVData* data) = 0;                            // 30
+    virtual HRESULT CountKLVData(aafUInt32* numData) = 0;                            // 31
+    virtual HRESULT GetKLVData(IEnumAAFKLVData** enumerator) = 0;                    // 32
+    virtual HRESULT RemoveKLVData(IAAFKLVData* data) = 0;                            // 33
     virtual HRESULT AppendAttribute(aafCharacter_constptr name,
-                                    aafCharacter_constptr value) = 0;  // 34
-    virtual HRESULT CountAttributes(aafUInt32* numAttributes) = 0;  // 35
+                                    aafCharacter_constptr value) = 0;      // 34
+    virtual HRESULT CountAttributes(aafUInt32* numAttributes) = 0;         // 35
     virtual HRESULT GetAttributes(IEnumAAFTaggedValues** enumerator) = 0;  // 36
-    virtual HRESULT RemoveAttribute(IAAFTaggedValue* attribute) = 0;  // 37
-    virtual HRESULT SetUsageCode(aafUID_constref usageCode) = 0;  // 38
-    virtual HRESULT GetUsageCode(aafUID_t* usageCode) = 0;  // 39
+    virtual HRESULT RemoveAttribute(IAAFTaggedValue* attribute) = 0;       // 37
+    virtual HRESULT SetUsageCode(aafUID_constref usageCode) = 0;           // 38
+    virtual HRESULT GetUsageCode(aafUID_t* usageCode) = 0;                 // 39
     virtual HRESULT AppendNewStaticSlot(IAAFSegment* segment, aafSlotID_t slotID,
                                         aafCharacter_constptr slotName,
                                         IAAFStaticMobSlot** newSlot) = 0;  // 40
@@ -146,8 +146,8 @@ struct IAAFMasterMob : IUnknown {
                                   IAAFSourceMob* sourceMob, aafSlotID_t masterSlotID,
                                   aafCharacter_constptr slotName) = 0;  // 4
     virtual HRESULT GetTapeName(aafUInt32 masterSlotID, aafCharacter* tapeName,
-                                aafUInt32 bufSize) = 0;  // 5
-    virtual HRESULT GetTapeNameBufLen(aafUInt32 masterSlotID, aafUInt32* len) = 0;  // 6
+                                aafUInt32 bufSize) = 0;                                     // 5
+    virtual HRESULT GetTapeNameBufLen(aafUInt32 masterSlotID, aafUInt32* len) = 0;          // 6
     virtual HRESULT GetNumRepresentations(aafSlotID_t slotID, aafNumSlots_t* numReps) = 0;  // 7
     virtual HRESULT GetRepresentation(aafSlotID_t slotID, aafUInt32 index,
                                       IAAFSegment** sourceClip) = 0;  // 8
@@ -193,8 +193,8 @@ struct IAAFMasterMob2 : IUnknown {
                                   IAAFSourceMob* sourceMob, aafSlotID_t masterSlotID,
                                   aafCharacter_constptr slotName) = 0;  // 4
     virtual HRESULT GetTapeName(aafUInt32 masterSlotID, aafCharacter* tapeName,
-                                aafUInt32 bufSize) = 0;  // 5
-    virtual HRESULT GetTapeNameBufLen(aafUInt32 masterSlotID, aafUInt32* len) = 0;  // 6
+                                aafUInt32 bufSize) = 0;                                     // 5
+    virtual HRESULT GetTapeNameBufLen(aafUInt32 masterSlotID, aafUInt32* len) = 0;          // 6
     virtual HRESULT GetNumRepresentations(aafSlotID_t slotID, aafNumSlots_t* numReps) = 0;  // 7
     virtual HRESULT GetRepresentation(aafSlotID_t slotID, aafUInt32 index,
                                       IAAFSegment** sourceClip) = 0;  // 8
@@ -258,8 +258,8 @@ struct IAAFMasterMob3 : IUnknown {
                                   IAAFSourceMob* sourceMob, aafSlotID_t masterSlotID,
                                   aafCharacter_constptr slotName) = 0;  // 4
     virtual HRESULT GetTapeName(aafUInt32 masterSlotID, aafCharacter* tapeName,
-                                aafUInt32 bufSize) = 0;  // 5
-    virtual HRESULT GetTapeNameBufLen(aafUInt32 masterSlotID, aafUInt32* len) = 0;  // 6
+                                aafUInt32 bufSize) = 0;                                     // 5
+    virtual HRESULT GetTapeNameBufLen(aafUInt32 masterSlotID, aafUInt32* len) = 0;          // 6
     virtual HRESULT GetNumRepresentations(aafSlotID_t slotID, aafNumSlots_t* numReps) = 0;  // 7
     virtual HRESULT GetRepresentation(aafSlotID_t slotID, aafUInt32 index,
                                       IAAFSegment** sourceClip) = 0;  // 8
@@ -342,9 +342,9 @@ constexpr const GUID& aafIdOf(const IAAFMasterMobEx*) {
 
 // Answered by AAFSourceMob.
 struct IAAFSourceMob : IUnknown {
-    virtual HRESULT Initialize() = 0;  // 3
+    virtual HRESULT Initialize() = 0;                                           // 3
     virtual HRESULT GetEssenceDescriptor(IAAFEssenceDescriptor** essence) = 0;  // 4
-    virtual HRESULT SetEssenceDescriptor(IAAFEssenceDescriptor* essence) = 0;  // 5
+    virtual HRESULT SetEssenceDescriptor(IAAFEssenceDescriptor* essence) = 0;   // 5
     virtual HRESULT AddNilReference(aafSlotID_t slotID, aafLength_t length, IAAFDataDef* dataDef,
                                     aafRational_t editRate) = 0;  // 6
     virtual HRESULT AppendTimecodeSlot(aafRational_t editrate, aafInt32 slotID,
@@ -396,16 +396,16 @@ constexpr const GUID& aafIdOf(const IAAFSearchSource*) {
 
 // Answered by AAFMobSlot.
 struct IAAFMobSlot : IUnknown {
-    virtual HRESULT GetSegment(IAAFSegment** result) = 0;  // 3
-    virtual HRESULT SetName(aafCharacter_constptr name) = 0;  // 4
+    virtual HRESULT GetSegment(IAAFSegment** result) = 0;                // 3
+    virtual HRESULT SetName(aafCharacter_constptr name) = 0;             // 4
     virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 5
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 6
-    virtual HRESULT GetPhysicalNum(aafUInt32* result) = 0;  // 7
-    virtual HRESULT GetDataDef(IAAFDataDef** result) = 0;  // 8
-    virtual HRESULT GetSlotID(aafSlotID_t* result) = 0;  // 9
-    virtual HRESULT SetSegment(IAAFSegment* segment) = 0;  // 10
-    virtual HRESULT SetPhysicalNum(aafUInt32 number) = 0;  // 11
-    virtual HRESULT SetSlotID(aafSlotID_t value) = 0;  // 12
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;               // 6
+    virtual HRESULT GetPhysicalNum(aafUInt32* result) = 0;               // 7
+    virtual HRESULT GetDataDef(IAAFDataDef** result) = 0;                // 8
+    virtual HRESULT GetSlotID(aafSlotID_t* result) = 0;                  // 9
+    virtual HRESULT SetSegment(IAAFSegment* segment) = 0;                // 10
+    virtual HRESULT SetPhysicalNum(aafUInt32 number) = 0;                // 11
+    virtual HRESULT SetSlotID(aafSlotID_t value) = 0;                    // 12
 
 protected:
     ~IAAFMobSlot() = default;
@@ -418,11 +418,11 @@ constexpr const GUID& aafIdOf(const IAAFMobSlot*) {
 
 // Answered by AAFTimelineMobSlot.
 struct IAAFTimelineMobSlot : IUnknown {
-    virtual HRESULT Initialize() = 0;  // 3
-    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;  // 4
+    virtual HRESULT Initialize() = 0;                                // 3
+    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;        // 4
     virtual HRESULT SetEditRate(aafRational_constref editRate) = 0;  // 5
-    virtual HRESULT GetOrigin(aafPosition_t* origin) = 0;  // 6
-    virtual HRESULT SetOrigin(aafPosition_t origin) = 0;  // 7
+    virtual HRESULT GetOrigin(aafPosition_t* origin) = 0;            // 6
+    virtual HRESULT SetOrigin(aafPosition_t origin) = 0;             // 7
 
 protected:
     ~IAAFTimelineMobSlot() = default;
@@ -435,17 +435,17 @@ constexpr const GUID& aafIdOf(const IAAFTimelineMobSlot*) {
 
 // Answered by AAFTimelineMobSlot.
 struct IAAFTimelineMobSlot2 : IUnknown {
-    virtual HRESULT Initialize() = 0;  // 3
-    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;  // 4
+    virtual HRESULT Initialize() = 0;                                // 3
+    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;        // 4
     virtual HRESULT SetEditRate(aafRational_constref editRate) = 0;  // 5
-    virtual HRESULT GetOrigin(aafPosition_t* origin) = 0;  // 6
-    virtual HRESULT SetOrigin(aafPosition_t origin) = 0;  // 7
-    virtual HRESULT GetMarkIn(aafPosition_t* result) = 0;  // 8
-    virtual HRESULT SetMarkIn(aafPosition_t value) = 0;  // 9
-    virtual HRESULT GetMarkOut(aafPosition_t* result) = 0;  // 10
-    virtual HRESULT SetMarkOut(aafPosition_t value) = 0;  // 11
-    virtual HRESULT GetUserPos(aafPosition_t* result) = 0;  // 12
-    virtual HRESULT SetUserPos(aafPosition_t value) = 0;  // 13
+    virtual HRESULT GetOrigin(aafPosition_t* origin) = 0;            // 6
+    virtual HRESULT SetOrigin(aafPosition_t origin) = 0;             // 7
+    virtual HRESULT GetMarkIn(aafPosition_t* result) = 0;            // 8
+    virtual HRESULT SetMarkIn(aafPosition_t value) = 0;              // 9
+    virtual HRESULT GetMarkOut(aafPosition_t* result) = 0;           // 10
+    virtual HRESULT SetMarkOut(aafPosition_t value) = 0;             // 11
+    virtual HRESULT GetUserPos(aafPosition_t* result) = 0;           // 12
+    virtual HRESULT SetUserPos(aafPosition_t value) = 0;             // 13
 
 protected:
     ~IAAFTimelineMobSlot2() = default;
@@ -483,10 +483,10 @@ constexpr const GUID& aafIdOf(const IAAFEventMobSlot*) {
 
 // Answered by AAFEventMobSlot.
 struct IAAFEventMobSlot2 : IUnknown {
-    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;  // 3
-    virtual HRESULT SetEditRate(aafRational_t* editRate) = 0;  // 4
+    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;                // 3
+    virtual HRESULT SetEditRate(aafRational_t* editRate) = 0;                // 4
     virtual HRESULT GetEventSlotOrigin(aafPosition_t* eventSlotOrigin) = 0;  // 5
-    virtual HRESULT SetEventSlotOrigin(aafPosition_t eventSlotOrigin) = 0;  // 6
+    virtual HRESULT SetEventSlotOrigin(aafPosition_t eventSlotOrigin) = 0;   // 6
 
 protected:
     ~IAAFEventMobSlot2() = default;
@@ -499,11 +499,11 @@ constexpr const GUID& aafIdOf(const IAAFEventMobSlot2*) {
 
 // Answered by EnumAAFMobSlots.
 struct IEnumAAFMobSlots : IUnknown {
-    virtual HRESULT NextOne(IAAFMobSlot** mobSlot) = 0;  // 3
+    virtual HRESULT NextOne(IAAFMobSlot** mobSlot) = 0;                                        // 3
     virtual HRESULT Next(aafUInt32 count, IAAFMobSlot** mobSlots, aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFMobSlots** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                 // 5
+    virtual HRESULT Reset() = 0;                                                               // 6
+    virtual HRESULT Clone(IEnumAAFMobSlots** enumerator) = 0;                                  // 7
 
 protected:
     ~IEnumAAFMobSlots() = default;
@@ -516,11 +516,11 @@ constexpr const GUID& aafIdOf(const IEnumAAFMobSlots*) {
 
 // Answered by EnumAAFMobs.
 struct IEnumAAFMobs : IUnknown {
-    virtual HRESULT NextOne(IAAFMob** mob) = 0;  // 3
+    virtual HRESULT NextOne(IAAFMob** mob) = 0;                                        // 3
     virtual HRESULT Next(aafUInt32 count, IAAFMob** mobs, aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFMobs** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                         // 5
+    virtual HRESULT Reset() = 0;                                                       // 6
+    virtual HRESULT Clone(IEnumAAFMobs** enumerator) = 0;                              // 7
 
 protected:
     ~IEnumAAFMobs() = default;
@@ -533,10 +533,10 @@ constexpr const GUID& aafIdOf(const IEnumAAFMobs*) {
 
 // Answered by AAFFindSourceInfo.
 struct IAAFFindSourceInfo : IUnknown {
-    virtual HRESULT GetMob(IAAFMob** mob) = 0;  // 3
+    virtual HRESULT GetMob(IAAFMob** mob) = 0;                          // 3
     virtual HRESULT GetSourceReference(aafSourceRef_t* sourceRef) = 0;  // 4
-    virtual HRESULT GetLength(aafLength_t* length) = 0;  // 5
-    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;  // 6
+    virtual HRESULT GetLength(aafLength_t* length) = 0;                 // 5
+    virtual HRESULT GetEditRate(aafRational_t* editRate) = 0;           // 6
 
 protected:
     ~IAAFFindSourceInfo() = default;
@@ -549,7 +549,7 @@ constexpr const GUID& aafIdOf(const IAAFFindSourceInfo*) {
 
 // Answered by AAFCompositionMob.
 struct IAAFCompositionMob : IUnknown {
-    virtual HRESULT Initialize(aafCharacter_constptr name) = 0;  // 3
+    virtual HRESULT Initialize(aafCharacter_constptr name) = 0;    // 3
     virtual HRESULT GetDefaultFade(aafDefaultFade_t* result) = 0;  // 4
     virtual HRESULT SetDefaultFade(aafLength_t fadeLength, aafFadeType_t fadeType,
                                    aafRational_t fadeEditUnit) = 0;  // 5
@@ -565,12 +565,12 @@ constexpr const GUID& aafIdOf(const IAAFCompositionMob*) {
 
 // Answered by AAFCompositionMob.
 struct IAAFCompositionMob2 : IUnknown {
-    virtual HRESULT Initialize(aafCharacter_constptr name) = 0;  // 3
+    virtual HRESULT Initialize(aafCharacter_constptr name) = 0;    // 3
     virtual HRESULT GetDefaultFade(aafDefaultFade_t* result) = 0;  // 4
     virtual HRESULT SetDefaultFade(aafLength_t fadeLength, aafFadeType_t fadeType,
                                    aafRational_t fadeEditUnit) = 0;  // 5
-    virtual HRESULT SetRendering(aafMobID_constref mobID) = 0;  // 6
-    virtual HRESULT GetRendering(aafMobID_t* mobID) = 0;  // 7
+    virtual HRESULT SetRendering(aafMobID_constref mobID) = 0;       // 6
+    virtual HRESULT GetRendering(aafMobID_t* mobID) = 0;             // 7
 
 protected:
     ~IAAFCompositionMob2() = default;

@@ -24,7 +24,7 @@ struct IEnumAAFTaggedValues;
 
 // Answered by AAFPropertyValue.
 struct IAAFPropertyValue : IUnknown {
-    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;  // 3
+    virtual HRESULT GetType(IAAFTypeDef** typeDef) = 0;          // 3
     virtual HRESULT IsDefinedType(aafBoolean_t* isDefined) = 0;  // 4
 
 protected:
@@ -39,22 +39,22 @@ constexpr const GUID& aafIdOf(const IAAFPropertyValue*) {
 // Answered by AAFObject.
 struct IAAFObject : IUnknown {
     virtual HRESULT GetGeneration(IAAFIdentification** generation) = 0;  // 3
-    virtual HRESULT GetGenerationAUID(aafUID_t* result) = 0;  // 4
-    virtual HRESULT GetDefinition(IAAFClassDef** classDef) = 0;  // 5
+    virtual HRESULT GetGenerationAUID(aafUID_t* result) = 0;             // 4
+    virtual HRESULT GetDefinition(IAAFClassDef** classDef) = 0;          // 5
     virtual HRESULT GetProperties(IEnumAAFProperties** enumerator) = 0;  // 6
-    virtual HRESULT CountProperties(aafUInt32* count) = 0;  // 7
+    virtual HRESULT CountProperties(aafUInt32* count) = 0;               // 7
     virtual HRESULT GetPropertyValue(IAAFPropertyDef* propDef,
                                      IAAFPropertyValue** propVal) = 0;  // 8
     virtual HRESULT SetPropertyValue(IAAFPropertyDef* propDef,
-                                     IAAFPropertyValue* propVal) = 0;  // 9
+                                     IAAFPropertyValue* propVal) = 0;                       // 9
     virtual HRESULT IsPropertyPresent(IAAFPropertyDef* propDef, aafBoolean_t* result) = 0;  // 10
-    virtual HRESULT RemoveOptionalProperty(IAAFPropertyDef* propDef) = 0;  // 11
+    virtual HRESULT RemoveOptionalProperty(IAAFPropertyDef* propDef) = 0;                   // 11
     virtual HRESULT CreateOptionalPropertyValue(IAAFPropertyDef* propDef,
                                                 IAAFPropertyValue** propVal) = 0;  // 12
-    virtual HRESULT GetDictionary(IAAFDictionary** dictionary) = 0;  // 13
-    virtual HRESULT EnableGenerationTracking() = 0;  // 14
-    virtual HRESULT DisableGenerationTracking() = 0;  // 15
-    virtual HRESULT IsGenerationTracked(aafBoolean_t* result) = 0;  // 16
+    virtual HRESULT GetDictionary(IAAFDictionary** dictionary) = 0;                // 13
+    virtual HRESULT EnableGenerationTracking() = 0;                                // 14
+    virtual HRESULT DisableGenerationTracking() = 0;                               // 15
+    virtual HRESULT IsGenerationTracked(aafBoolean_t* result) = 0;                 // 16
 
 protected:
     ~IAAFObject() = default;
@@ -69,12 +69,12 @@ constexpr const GUID& aafIdOf(const IAAFObject*) {
 struct IAAFTaggedValue : IUnknown {
     virtual HRESULT Initialize(aafCharacter_constptr name, IAAFTypeDef* typeDef,
                                aafUInt32 valueSize, aafDataBuffer_t value) = 0;  // 3
-    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;  // 4
-    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;  // 5
-    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;  // 6
+    virtual HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) = 0;          // 4
+    virtual HRESULT GetNameBufLen(aafUInt32* bufSize) = 0;                       // 5
+    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;                // 6
     virtual HRESULT GetValue(aafUInt32 valueSize, aafDataBuffer_t value,
-                             aafUInt32* bytesRead) = 0;  // 7
-    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;  // 8
+                             aafUInt32* bytesRead) = 0;                        // 7
+    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;                        // 8
     virtual HRESULT SetValue(aafUInt32 valueSize, aafDataBuffer_t value) = 0;  // 9
 
 protected:
@@ -90,9 +90,9 @@ constexpr const GUID& aafIdOf(const IAAFTaggedValue*) {
 struct IEnumAAFTaggedValues : IUnknown {
     virtual HRESULT NextOne(IAAFTaggedValue** taggedValues) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFTaggedValue** taggedValues,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;               // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                     // 5
+    virtual HRESULT Reset() = 0;                                   // 6
     virtual HRESULT Clone(IEnumAAFTaggedValues** enumerator) = 0;  // 7
 
 protected:
@@ -108,9 +108,9 @@ constexpr const GUID& aafIdOf(const IEnumAAFTaggedValues*) {
 struct IEnumAAFProperties : IUnknown {
     virtual HRESULT NextOne(IAAFProperty** properties) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFProperty** properties,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;             // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                   // 5
+    virtual HRESULT Reset() = 0;                                 // 6
     virtual HRESULT Clone(IEnumAAFProperties** enumerator) = 0;  // 7
 
 protected:
@@ -125,7 +125,7 @@ constexpr const GUID& aafIdOf(const IEnumAAFProperties*) {
 // Answered by AAFProperty.
 struct IAAFProperty : IUnknown {
     virtual HRESULT GetDefinition(IAAFPropertyDef** propDef) = 0;  // 3
-    virtual HRESULT GetValue(IAAFPropertyValue** value) = 0;  // 4
+    virtual HRESULT GetValue(IAAFPropertyValue** value) = 0;       // 4
 
 protected:
     ~IAAFProperty() = default;
@@ -140,9 +140,9 @@ constexpr const GUID& aafIdOf(const IAAFProperty*) {
 struct IEnumAAFPropertyValues : IUnknown {
     virtual HRESULT NextOne(IAAFPropertyValue** propertyValue) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFPropertyValue** propertyValues,
-                         aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* fetched) = 0;                    // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                       // 5
+    virtual HRESULT Reset() = 0;                                     // 6
     virtual HRESULT Clone(IEnumAAFPropertyValues** enumerator) = 0;  // 7
 
 protected:
@@ -156,11 +156,11 @@ constexpr const GUID& aafIdOf(const IEnumAAFPropertyValues*) {
 
 // Answered by EnumAAFKLVData.
 struct IEnumAAFKLVData : IUnknown {
-    virtual HRESULT NextOne(IAAFKLVData** KLVData) = 0;  // 3
+    virtual HRESULT NextOne(IAAFKLVData** KLVData) = 0;                                       // 3
     virtual HRESULT Next(aafUInt32 count, IAAFKLVData** KLVData, aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
-    virtual HRESULT Clone(IEnumAAFKLVData** enumerator) = 0;  // 7
+    virtual HRESULT Skip(aafUInt32 count) = 0;                                                // 5
+    virtual HRESULT Reset() = 0;                                                              // 6
+    virtual HRESULT Clone(IEnumAAFKLVData** enumerator) = 0;                                  // 7
 
 protected:
     ~IEnumAAFKLVData() = default;
@@ -174,10 +174,10 @@ constexpr const GUID& aafIdOf(const IEnumAAFKLVData*) {
 // Answered by AAFKLVData.
 struct IAAFKLVData : IUnknown {
     virtual HRESULT Initialize(aafUID_t key, aafUInt32 length, aafDataBuffer_t value) = 0;  // 3
-    virtual HRESULT GetKey(aafUID_t* key) = 0;  // 4
+    virtual HRESULT GetKey(aafUID_t* key) = 0;                                              // 4
     virtual HRESULT GetValue(aafUInt32 valueSize, aafDataBuffer_t value,
-                             aafUInt32* bytesRead) = 0;  // 5
-    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;  // 6
+                             aafUInt32* bytesRead) = 0;                        // 5
+    virtual HRESULT GetValueBufLen(aafUInt32* len) = 0;                        // 6
     virtual HRESULT SetValue(aafUInt32 valueSize, aafDataBuffer_t value) = 0;  // 7
 
 protected:
@@ -195,7 +195,8 @@ protected:
     ~IAAFDescriptiveFramework() = default;
 };
 
-inline constexpr GUID IID_IAAFDescriptiveFramework = ncfGuid("1CDED29F-B8F0-437D-ABB0-2144DD35B4AA");
+inline constexpr GUID IID_IAAFDescriptiveFramework =
+    ncfGuid("1CDED29F-B8F0-437D-ABB0-2144DD35B4AA");
 constexpr const GUID& aafIdOf(const IAAFDescriptiveFramework*) {
     return IID_IAAFDescriptiveFramework;
 }
@@ -213,15 +214,15 @@ constexpr const GUID& aafIdOf(const IAAFDescriptiveObject*) {
 
 // Answered by AAFRIFFChunk.
 struct IAAFRIFFChunk : IUnknown {
-    virtual HRESULT Initialize(aafUInt32 chunkID) = 0;  // 3
-    virtual HRESULT SetChunkID(aafUInt32 chunkID) = 0;  // 4
-    virtual HRESULT GetChunkID(aafUInt32* chunkID) = 0;  // 5
+    virtual HRESULT Initialize(aafUInt32 chunkID) = 0;                                        // 3
+    virtual HRESULT SetChunkID(aafUInt32 chunkID) = 0;                                        // 4
+    virtual HRESULT GetChunkID(aafUInt32* chunkID) = 0;                                       // 5
     virtual HRESULT Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) = 0;  // 6
     virtual HRESULT Write(aafUInt32 bytes, aafDataBuffer_t buffer,
-                          aafUInt32* bytesWritten) = 0;  // 7
-    virtual HRESULT SetPosition(aafPosition_t offset) = 0;  // 8
+                          aafUInt32* bytesWritten) = 0;      // 7
+    virtual HRESULT SetPosition(aafPosition_t offset) = 0;   // 8
     virtual HRESULT GetPosition(aafPosition_t* offset) = 0;  // 9
-    virtual HRESULT GetLength(aafLength_t* length) = 0;  // 10
+    virtual HRESULT GetLength(aafLength_t* length) = 0;      // 10
 
 protected:
     ~IAAFRIFFChunk() = default;
@@ -236,9 +237,9 @@ constexpr const GUID& aafIdOf(const IAAFRIFFChunk*) {
 struct IEnumAAFRIFFChunks : IUnknown {
     virtual HRESULT NextOne(IAAFRIFFChunk** RIFFChunks) = 0;  // 3
     virtual HRESULT Next(aafUInt32 count, IAAFRIFFChunk** RIFFChunks,
-                         aafUInt32* numFetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;  // 5
-    virtual HRESULT Reset() = 0;  // 6
+                         aafUInt32* numFetched) = 0;             // 4
+    virtual HRESULT Skip(aafUInt32 count) = 0;                   // 5
+    virtual HRESULT Reset() = 0;                                 // 6
     virtual HRESULT Clone(IEnumAAFRIFFChunks** enumerator) = 0;  // 7
 
 protected:

@@ -15,7 +15,8 @@
 #define NCF_PLUGIN_EXPORT extern "C" __attribute__((visibility("default")))
 #endif
 
-using NCFRegisterPluginFunction = NCFRESULT (*)(INCFUnknown* host, INCFPluginDefinition** outDefinition);
+using NCFRegisterPluginFunction = NCFRESULT (*)(INCFUnknown* host,
+                                                INCFPluginDefinition** outDefinition);
 using NCFRegisterComponentFunction = NCFRESULT (*)(INCFUnknown* host, ncfUInt32 index,
                                                    INCFComponentDefinition** outDefinition);
 using NCFGetClassFactoryFunction = NCFRESULT (*)(INCFUnknown* host, const GUID& classId,

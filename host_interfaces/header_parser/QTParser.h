@@ -17,17 +17,17 @@ struct IQTParser : INCFUnknown {
     virtual NCFRESULT GetTimeScale(ncfUInt32* timescale) = 0;
     // 6. In movie time units.
     virtual NCFRESULT GetMovieDuration(ncfUInt32* duration) = 0;
-    virtual NCFRESULT ReservedParser7() = 0;  // 7
-    virtual NCFRESULT ReservedParser8() = 0;  // 8
-    virtual NCFRESULT ReservedParser9() = 0;  // 9
-    virtual NCFRESULT GetVideoTrackCount(ncfUInt32* count) = 0;                             // 10
-    virtual NCFRESULT GetAudioTrackCount(ncfUInt32* count) = 0;                             // 11
-    virtual NCFRESULT GetTimeCodeTrackCount(ncfUInt32* count) = 0;                          // 12
-    virtual NCFRESULT GetOtherTrackCount(ncfUInt32* count) = 0;                             // 13
-    virtual NCFRESULT GetVideoTrackInfo(ncfUInt32 index, IVideoTrackInfo** track) = 0;      // 14
-    virtual NCFRESULT GetAudioTrackInfo(ncfUInt32 index, IAudioTrackInfo** track) = 0;      // 15
-    virtual NCFRESULT GetTimeCodeTrackInfo(ncfUInt32 index, ITrackInfo** track) = 0;        // 16
-    virtual NCFRESULT GetOtherTrackInfo(ncfUInt32 index, ITrackInfo** track) = 0;           // 17
+    virtual NCFRESULT ReservedParser7() = 0;                                            // 7
+    virtual NCFRESULT ReservedParser8() = 0;                                            // 8
+    virtual NCFRESULT ReservedParser9() = 0;                                            // 9
+    virtual NCFRESULT GetVideoTrackCount(ncfUInt32* count) = 0;                         // 10
+    virtual NCFRESULT GetAudioTrackCount(ncfUInt32* count) = 0;                         // 11
+    virtual NCFRESULT GetTimeCodeTrackCount(ncfUInt32* count) = 0;                      // 12
+    virtual NCFRESULT GetOtherTrackCount(ncfUInt32* count) = 0;                         // 13
+    virtual NCFRESULT GetVideoTrackInfo(ncfUInt32 index, IVideoTrackInfo** track) = 0;  // 14
+    virtual NCFRESULT GetAudioTrackInfo(ncfUInt32 index, IAudioTrackInfo** track) = 0;  // 15
+    virtual NCFRESULT GetTimeCodeTrackInfo(ncfUInt32 index, ITrackInfo** track) = 0;    // 16
+    virtual NCFRESULT GetOtherTrackInfo(ncfUInt32 index, ITrackInfo** track) = 0;       // 17
     // 18. Takes the bytes [begin, end) that stand at `position` of the file.
     // NCF_OK when all headers are known, QT_E_MOREDATA when it wants the range
     // of operation 19, any other code to give the file up.

@@ -15,8 +15,8 @@ static_assert(sizeof(QTNivoResolution) == 32, "the parser fills a record of 32 b
 // Video Media). Four-character codes are numbers with the first character in
 // the most significant byte.
 struct IVideoSampleDescription : INCFUnknown {
-    virtual NCFRESULT GetDataFormat(ncfUInt32* dataFormat) = 0;    // 3
-    virtual NCFRESULT ReservedVideoDescription4() = 0;             // 4
+    virtual NCFRESULT GetDataFormat(ncfUInt32* dataFormat) = 0;  // 3
+    virtual NCFRESULT ReservedVideoDescription4() = 0;           // 4
     // 5. Pixels of the encoded picture.
     virtual NCFRESULT GetEncodedWidthAndHeight(ncfUInt16* width, ncfUInt16* height) = 0;
     virtual NCFRESULT ReservedVideoDescription6() = 0;  // 6
@@ -71,9 +71,9 @@ constexpr const GUID& ncfIdOf(const IVideoSampleDescription*) {
 // Sound sample description, versions 0, 1 and 2 (QuickTime File Format, Sound
 // Media; ISO/IEC 14496-12, 12.2.3).
 struct IAudioSampleDescription : INCFUnknown {
-    virtual NCFRESULT ReservedAudioDescription3() = 0;              // 3
-    virtual NCFRESULT ReservedAudioDescription4() = 0;              // 4
-    virtual NCFRESULT GetChannelsPerFrame(ncfUInt32* channels) = 0; // 5
+    virtual NCFRESULT ReservedAudioDescription3() = 0;               // 3
+    virtual NCFRESULT ReservedAudioDescription4() = 0;               // 4
+    virtual NCFRESULT GetChannelsPerFrame(ncfUInt32* channels) = 0;  // 5
     // 6. True depth of one channel in bits, 0 for compressed sound.
     virtual NCFRESULT GetBitsPerChannel(ncfUInt32* bits) = 0;
     // 7. Frames per second, above 0 and at most 10^9.

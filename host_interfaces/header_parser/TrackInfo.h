@@ -32,12 +32,12 @@ struct ITrackInfo : INCFUnknown {
     virtual NCFRESULT GetMediaTS(ncfUInt32* timescale) = 0;
     // 15. In media time units.
     virtual NCFRESULT GetMediaDuration(ncfUInt32* duration) = 0;
-    virtual NCFRESULT GetSampleTable(IQTSampleTable** table) = 0;          // 16
-    virtual NCFRESULT GetSampleDescriptionCount(ncfUInt32* count) = 0;     // 17
-    virtual NCFRESULT ReservedTrack18() = 0;                               // 18
-    virtual NCFRESULT ReservedTrack19() = 0;                               // 19
-    virtual NCFRESULT ReservedTrack20() = 0;                               // 20
-    virtual NCFRESULT ReservedTrack21() = 0;                               // 21
+    virtual NCFRESULT GetSampleTable(IQTSampleTable** table) = 0;       // 16
+    virtual NCFRESULT GetSampleDescriptionCount(ncfUInt32* count) = 0;  // 17
+    virtual NCFRESULT ReservedTrack18() = 0;                            // 18
+    virtual NCFRESULT ReservedTrack19() = 0;                            // 19
+    virtual NCFRESULT ReservedTrack20() = 0;                            // 20
+    virtual NCFRESULT ReservedTrack21() = 0;                            // 21
 
 protected:
     ~ITrackInfo() = default;

@@ -13,8 +13,8 @@ struct IMediaContainer : INCFUnknown {
     // 3. 1 when the file could be loaded, 0 when not. May throw an NCFRESULT:
     // the one operation that does, for a file that can't be opened.
     virtual NCFRESULT IsContainerSupported() = 0;
-    virtual NCFRESULT ContainerFlag() = 0;                                             // 4: 1
-    virtual NCFRESULT ContainerUnsupportedA(void* a, void* b, void* c) = 0;            // 5
+    virtual NCFRESULT ContainerFlag() = 0;                                   // 4: 1
+    virtual NCFRESULT ContainerUnsupportedA(void* a, void* b, void* c) = 0;  // 5
     // 6. Describes the clip anew.
     virtual NCFRESULT GetAAFMasterClips(IAAFClips** ppClips) = 0;
     // 7. Works once: NMA_E_ALREADYSET afterwards. The string is copied.
@@ -36,8 +36,8 @@ struct IMediaContainer3 : IMediaContainer2 {
     virtual NCFRESULT GetCapabilities(ncfUInt32* flags) = 0;  // 10
     virtual ncfUInt32 GetFileTypeCount() = 0;                 // 11: the value
     // 12. One file type; each output may be null, else it is a new string.
-    virtual NCFRESULT GetFileType(ncfUInt32 index, INCFString** extension,
-                                  INCFString** description, INCFString** group) = 0;
+    virtual NCFRESULT GetFileType(ncfUInt32 index, INCFString** extension, INCFString** description,
+                                  INCFString** group) = 0;
 
 protected:
     ~IMediaContainer3() = default;

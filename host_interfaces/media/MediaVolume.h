@@ -31,13 +31,13 @@ protected:
 
 // What a claimed folder offers.
 struct IMediaFormat : INCFUnknown {
-    virtual ncfBool FormatFlagA() = 0;                           // 3
-    virtual ncfBool FormatFlagB() = 0;                           // 4
-    virtual ncfBool FormatFlagC() = 0;                           // 5
-    virtual ncfBool FormatFlagD() = 0;                           // 6
-    virtual NCFRESULT FormatUnsupportedA(void* argument) = 0;    // 7
-    virtual NCFRESULT FormatUnsupportedB(void* argument) = 0;    // 8
-    virtual NCFRESULT GetAAFClips(IAAFClips** clips) = 0;        // 9
+    virtual ncfBool FormatFlagA() = 0;                         // 3
+    virtual ncfBool FormatFlagB() = 0;                         // 4
+    virtual ncfBool FormatFlagC() = 0;                         // 5
+    virtual ncfBool FormatFlagD() = 0;                         // 6
+    virtual NCFRESULT FormatUnsupportedA(void* argument) = 0;  // 7
+    virtual NCFRESULT FormatUnsupportedB(void* argument) = 0;  // 8
+    virtual NCFRESULT GetAAFClips(IAAFClips** clips) = 0;      // 9
 
 protected:
     ~IMediaFormat() = default;
@@ -45,10 +45,10 @@ protected:
 
 // Claims folders.
 struct IMediaVolume : INCFUnknown {
-    virtual NCFRESULT IsMediaVolume(INCFString* path) = 0;                             // 3: 1 or 0
-    virtual NCFRESULT GetVolumeInfo(INCFString* path, IVolumeInfo** info) = 0;         // 4
-    virtual NCFRESULT GetMediaFormat(INCFString* path, IMediaFormat** format) = 0;     // 5
-    virtual NCFRESULT GetContainerComponentId(GUID* id) = 0;                           // 6
+    virtual NCFRESULT IsMediaVolume(INCFString* path) = 0;                          // 3: 1 or 0
+    virtual NCFRESULT GetVolumeInfo(INCFString* path, IVolumeInfo** info) = 0;      // 4
+    virtual NCFRESULT GetMediaFormat(INCFString* path, IMediaFormat** format) = 0;  // 5
+    virtual NCFRESULT GetContainerComponentId(GUID* id) = 0;                        // 6
 
 protected:
     ~IMediaVolume() = default;

@@ -18,8 +18,8 @@ struct IQuickTimeProperty : INCFUnknown {
     // for a well-formed but unknown code, a failure for code 0 or unprintable
     // ones. Works before CreateMovie.
     virtual NCFRESULT GetCodecName(ncfUInt32 codecType, INCFString* name) = 0;
-    virtual NCFRESULT GetCodecStorageType(ncfUInt32* type) = 0;        // 6. 0 Y'CbCr, 1 RGB
-    virtual NCFRESULT DoesCodecSupportRGB_CCIR(ncfUInt32* flag) = 0;   // 7. RGB in video range
+    virtual NCFRESULT GetCodecStorageType(ncfUInt32* type) = 0;       // 6. 0 Y'CbCr, 1 RGB
+    virtual NCFRESULT DoesCodecSupportRGB_CCIR(ncfUInt32* flag) = 0;  // 7. RGB in video range
 
 protected:
     ~IQuickTimeProperty() = default;

@@ -16,31 +16,31 @@ inline constexpr ncfUInt32 kAlphaCheckForQTNMA = 1;   // the first decoded pictu
 // ids, never 0. Until a movie is open every operation answers
 // NMA_E_NOTINITIALIZED, 0 or false. Outputs that may be null are skipped then.
 struct IQuickTimeWrapper : INCFUnknown {
-    virtual NCFRESULT PreparePixelFormat(ncfUInt32 fourCC) = 0;                  // 3
-    virtual NCFRESULT GetSampleTable(IQTWSampleTable** table) = 0;               // 4
-    virtual NCFRESULT GetQTAudioReader(IQTAudioReader** reader) = 0;             // 5
-    virtual NCFRESULT GetQTVideoReader(IQTVideoReader** reader) = 0;             // 6
+    virtual NCFRESULT PreparePixelFormat(ncfUInt32 fourCC) = 0;       // 3
+    virtual NCFRESULT GetSampleTable(IQTWSampleTable** table) = 0;    // 4
+    virtual NCFRESULT GetQTAudioReader(IQTAudioReader** reader) = 0;  // 5
+    virtual NCFRESULT GetQTVideoReader(IQTVideoReader** reader) = 0;  // 6
     // 7. bits: 1 top field first, 8 fields stored apart. NMA_E_FIELDS when the
     // movie does not say.
     virtual NCFRESULT QueryVideoDescBufferDetails(ncfUInt32* interlaced, ncfUInt32* bits) = 0;
     virtual NCFRESULT GetCodecColorSpaceInfo(ncfBool* found709, ncfBool* found601) = 0;  // 8
     virtual ncfBool MovieHasOneFrame() = 0;                                              // 9
-    virtual ncfUInt32 GetResolutionId(ncfUInt32 track) = 0;                              // 10. 0 = none
-    virtual NCFRESULT GetCodecTypeName(ncfUInt32 track, INCFString* name) = 0;           // 11. assigned to
+    virtual ncfUInt32 GetResolutionId(ncfUInt32 track) = 0;                     // 10. 0 = none
+    virtual NCFRESULT GetCodecTypeName(ncfUInt32 track, INCFString* name) = 0;  // 11. assigned to
     // 12. Each flag tells whether those tracks disagree with the length, which
     // is in edit units of the rate.
     virtual NCFRESULT MovieTrackDurationIssues(ncfSInt32 rateNum, ncfSInt32 rateDen,
                                                ncfUInt64 length, ncfBool* sound,
                                                ncfBool* picture) = 0;
-    virtual ncfBool MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) = 0;               // 13
-    virtual ncfBool GetFirstVideoTrack(ncfUInt32* track) = 0;                            // 14
+    virtual ncfBool MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) = 0;  // 13
+    virtual ncfBool GetFirstVideoTrack(ncfUInt32* track) = 0;               // 14
     // 15. Fields in a frame, 1 or 2; false: unknown.
     virtual ncfBool GetFieldLayoutForTrack(ncfUInt32 track, ncfUInt32* fieldCount) = 0;
     // 16. Code of the sample description of any kind of track, four bytes in
     // text order.
     virtual NCFRESULT GetFourCCFromImageDescrptor(ncfUInt32 track, ncfUInt8* fourBytes) = 0;
-    virtual ncfUInt32 GetImageDescriptionCount(ncfUInt32 track) = 0;                     // 17
-    virtual NCFRESULT MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) = 0;            // 18
+    virtual ncfUInt32 GetImageDescriptionCount(ncfUInt32 track) = 0;           // 17
+    virtual NCFRESULT MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) = 0;  // 18
     // 19. Each output may be null. `formatID` is a code of the sound system,
     // 'lpcm' for every linear kind. Bits are 0 for compressed sound.
     virtual NCFRESULT GetAudioInfoForTrack(ncfUInt32 track, ncfUInt32* channels, double* sampleRate,
@@ -52,34 +52,35 @@ struct IQuickTimeWrapper : INCFUnknown {
     // null.
     virtual NCFRESULT GetMovieBox(ncfUInt32* width, ncfUInt32* height, ncfUInt32* aspectNum,
                                   ncfUInt32* aspectDen) = 0;
-    virtual ncfUInt64 GetMovieCreationTime() = 0;                                        // 21. seconds from 1904 UTC
-    virtual ncfUInt32 GetDescribedTrackCount() = 0;                                      // 22
-    virtual ncfUInt32 MovieIsSelfContained(ncfUInt32, ncfUInt32, ncfUInt32) = 0;         // 23. the low byte counts
+    virtual ncfUInt64 GetMovieCreationTime() = 0;    // 21. seconds from 1904 UTC
+    virtual ncfUInt32 GetDescribedTrackCount() = 0;  // 22
+    virtual ncfUInt32 MovieIsSelfContained(ncfUInt32, ncfUInt32,
+                                           ncfUInt32) = 0;  // 23. the low byte counts
     // 24. drop is 0 or 1.
     virtual NCFRESULT GetTimeCodeInfoForTrack(ncfUInt32 track, ncfUInt8* hours, ncfUInt8* minutes,
                                               ncfUInt8* seconds, ncfUInt8* frames,
                                               ncfUInt32* timeScale, ncfUInt32* frameDuration,
                                               ncfUInt32* drop, ncfUInt32* numFrames) = 0;
-    virtual ncfBool IsVideoTrack(ncfUInt32 track) = 0;                                   // 25
-    virtual ncfBool IsAudioTrack(ncfUInt32 track) = 0;                                   // 26
-    virtual ncfBool IsTimeCodeTrack(ncfUInt32 track) = 0;                                // 27
-    virtual ncfUInt32 GetNumberOfTracks() = 0;                                           // 28. highest track number
-    virtual ncfBool MovieHasAudio() = 0;                                                 // 29
+    virtual ncfBool IsVideoTrack(ncfUInt32 track) = 0;     // 25
+    virtual ncfBool IsAudioTrack(ncfUInt32 track) = 0;     // 26
+    virtual ncfBool IsTimeCodeTrack(ncfUInt32 track) = 0;  // 27
+    virtual ncfUInt32 GetNumberOfTracks() = 0;             // 28. highest track number
+    virtual ncfBool MovieHasAudio() = 0;                   // 29
     // 30. Opens the file at a borrowed path. A failure leaves no movie open.
     virtual NCFRESULT NewMovieFromFilePath(INCFString* path) = 0;
     // 31. Rates of 0 mean not given. Entry i of the track lengths is track
     // i + 1, in edit units.
     virtual NCFRESULT DetermineMovieEditRateAndLength(double forcedRate, double editorRate,
-                                                      ncfUInt32 singleFrameDuration,
-                                                      ncfSInt32* num, ncfSInt32* den,
-                                                      ncfUInt64* length, ncfUInt64* trackLengths,
+                                                      ncfUInt32 singleFrameDuration, ncfSInt32* num,
+                                                      ncfSInt32* den, ncfUInt64* length,
+                                                      ncfUInt64* trackLengths,
                                                       ncfUInt32 trackLengthCount,
                                                       ncfBool useMovieHeader) = 0;
     virtual NCFRESULT QTWSetMovieBox(ncfSInt16 top, ncfSInt16 left, ncfSInt16 bottom,
-                                     ncfSInt16 right) = 0;                               // 32
-    virtual NCFRESULT GetVendor(ncfUInt32 track, ncfUInt32* vendor) = 0;                 // 33. 0: none
-    virtual ncfUInt64 GetTrackDuration(ncfUInt32 track) = 0;                             // 34. movie time units
-    virtual ncfUInt32 GetMovieTimeScale() = 0;                                           // 35. units per second
+                                     ncfSInt16 right) = 0;                // 32
+    virtual NCFRESULT GetVendor(ncfUInt32 track, ncfUInt32* vendor) = 0;  // 33. 0: none
+    virtual ncfUInt64 GetTrackDuration(ncfUInt32 track) = 0;              // 34. movie time units
+    virtual ncfUInt32 GetMovieTimeScale() = 0;                            // 35. units per second
 
 protected:
     ~IQuickTimeWrapper() = default;

@@ -19,9 +19,9 @@ struct IQTVideoReader : INCFUnknown {
     // 5. Bytes of one picture in the format set; 0 without a format. The first
     // argument is 0xFFFFFFFF.
     virtual ncfUInt32 GetFrameBufferSize(ncfUInt32 all, ncfUInt64 sample, ncfUInt32) = 0;
-    virtual NCFRESULT InitQT(ncfUInt32 mode) = 0;             // 6. Again while started: NCF_OK
-    virtual NCFRESULT ReservedVideoReaderOperation() = 0;     // 7
-    virtual NCFRESULT ReleaseQT() = 0;                        // 8. Again while released: NCF_OK
+    virtual NCFRESULT InitQT(ncfUInt32 mode) = 0;          // 6. Again while started: NCF_OK
+    virtual NCFRESULT ReservedVideoReaderOperation() = 0;  // 7
+    virtual NCFRESULT ReleaseQT() = 0;                     // 8. Again while released: NCF_OK
 
 protected:
     ~IQTVideoReader() = default;

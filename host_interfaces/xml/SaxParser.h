@@ -9,10 +9,10 @@ namespace UTIL {
 // Receives the events of a document in order. Strings are borrowed and valid
 // for the call only. A negative result ends the parse and is its result.
 struct INCFSaxDocumentHandler : INCFUnknown {
-    virtual NCFRESULT Start() = 0;                                            // 3
-    virtual NCFRESULT End() = 0;                                              // 4, after success only
-    virtual NCFRESULT Element(INCFString* tag) = 0;                           // 5
-    virtual NCFRESULT Attribute(INCFString* name, INCFString* value) = 0;     // 6
+    virtual NCFRESULT Start() = 0;                                         // 3
+    virtual NCFRESULT End() = 0;                                           // 4, after success only
+    virtual NCFRESULT Element(INCFString* tag) = 0;                        // 5
+    virtual NCFRESULT Attribute(INCFString* name, INCFString* value) = 0;  // 6
     // 7. One event for each run of text between markup, never trimmed.
     virtual NCFRESULT Text(INCFString* text) = 0;
 

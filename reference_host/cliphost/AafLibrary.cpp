@@ -31,8 +31,8 @@ AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
                                   "--aaf-library FILE",
                                   DisplayPath(file), reason));
     }
-    for (const char* const name : {"AAFFileOpenTransient", "AAFFileOpenExistingRead",
-                                   "AAFFileOpenNewModifyEx"}) {
+    for (const char* const name :
+         {"AAFFileOpenTransient", "AAFFileOpenExistingRead", "AAFFileOpenNewModifyEx"}) {
         if (!library_.Find(name)) {
             throw Failure(kExitCaller, fmt::format("{}: is no AAF library: it lacks {}",
                                                    DisplayPath(file), name));
@@ -63,11 +63,11 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     const auto check = [&](HRESULT result, const char* step) {
         if (result < 0) {
             const std::string reason = TextOfResult(result);
-            throw Failure(kExitFile,
-                          fmt::format("{}: not saved: {} failed: {}", DisplayPath(path), step,
-                                      reason.empty() ? fmt::format("0x{:08X}",
-                                                                   static_cast<ncfUInt32>(result))
-                                                     : reason));
+            throw Failure(
+                kExitFile,
+                fmt::format("{}: not saved: {} failed: {}", DisplayPath(path), step,
+                            reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result))
+                                           : reason));
         }
     };
     // A library may refuse to open over a file that exists.

@@ -92,8 +92,7 @@ TreeNode ReadObject(IAAFObject* object, int depth) {
     TreeNode node;
     AafRef<IAAFClassDef> definition;
     if (object->GetDefinition(definition.Out()) >= 0) {
-        node.title =
-            TextOf(definition.get(), &IAAFClassDef::GetNameBufLen, &IAAFClassDef::GetName);
+        node.title = TextOf(definition.get(), &IAAFClassDef::GetNameBufLen, &IAAFClassDef::GetName);
     }
     AafRef<IEnumAAFProperties> properties;
     if (depth > kDeepest || object->GetProperties(properties.Out()) < 0) {

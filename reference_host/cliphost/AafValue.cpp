@@ -169,14 +169,12 @@ std::string ReferenceText(IAAFTypeDef* type, IAAFPropertyValue* value) {
         return name.empty() ? ToText(id) : fmt::format("{} {}", name, ToText(id));
     }
     if (const auto meta = As<IAAFMetaDefinition>(target.get())) {
-        return TextOf(meta.get(), &IAAFMetaDefinition::GetNameBufLen,
-                      &IAAFMetaDefinition::GetName);
+        return TextOf(meta.get(), &IAAFMetaDefinition::GetNameBufLen, &IAAFMetaDefinition::GetName);
     }
     return kUnreadable;
 }
 
-std::string ElementsText(aafUInt32 count, bool complete,
-                         const std::vector<std::string>& elements) {
+std::string ElementsText(aafUInt32 count, bool complete, const std::vector<std::string>& elements) {
     std::string text = "[";
     for (const std::string& element : elements) {
         text += (text.size() > 1 ? ", " : "") + element;
@@ -214,8 +212,7 @@ std::string SetText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     const auto set = As<IAAFTypeDefSet>(type);
     AafRef<IEnumAAFPropertyValues> enumerator;
     aafUInt32 count = 0;
-    if (!set || set->GetCount(value, &count) < 0 ||
-        set->GetElements(value, enumerator.Out()) < 0) {
+    if (!set || set->GetCount(value, &count) < 0 || set->GetElements(value, enumerator.Out()) < 0) {
         return kUnreadable;
     }
     std::vector<std::string> elements;
@@ -229,16 +226,15 @@ std::string SetText(IAAFTypeDef* type, IAAFPropertyValue* value) {
 std::string IndirectText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     const auto indirect = As<IAAFTypeDefIndirect>(type);
     AafRef<IAAFPropertyValue> actual;
-    return indirect && indirect->GetActualValue(value, actual.Out()) >= 0
-               ? ValueText(actual.get())
-               : kUnreadable;
+    return indirect && indirect->GetActualValue(value, actual.Out()) >= 0 ? ValueText(actual.get())
+                                                                          : kUnreadable;
 }
 
 std::string RenamedText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     const auto rename = As<IAAFTypeDefRename>(type);
     AafRef<IAAFPropertyValue> base;
     return rename && rename->GetBaseValue(value, base.Out()) >= 0 ? ValueText(base.get())
-                                                                 : kUnreadable;
+                                                                  : kUnreadable;
 }
 
 }  // namespace
@@ -287,9 +283,9 @@ std::string ToText(const aafMobID_t& id) {
 
 std::string ToText(const aafTimeStamp_t& time) {
     return fmt::format("{:04}-{:02}-{:02}T{:02}:{:02}:{:02}.{:02}Z", time.date.year,
-                       unsigned{time.date.month}, unsigned{time.date.day},
-                       unsigned{time.time.hour}, unsigned{time.time.minute},
-                       unsigned{time.time.second}, unsigned{time.time.fraction});
+                       unsigned{time.date.month}, unsigned{time.date.day}, unsigned{time.time.hour},
+                       unsigned{time.time.minute}, unsigned{time.time.second},
+                       unsigned{time.time.fraction});
 }
 
 std::string ValueText(IAAFPropertyValue* value) {

@@ -24,8 +24,8 @@ std::string Problem(Session& session, const std::filesystem::path& movie, NCFRES
     }
     const std::vector<std::string> missing = session.MissingDataFiles();
     for (const std::string& file : missing) {
-        text += fmt::format("\n  {}: this data file is missing; put it back beside the module",
-                            file);
+        text +=
+            fmt::format("\n  {}: this data file is missing; put it back beside the module", file);
     }
     if (missing.empty()) {
         text += "\n  " + DiagnoseMovie(movie);

@@ -13,9 +13,9 @@ namespace cliphost {
 // One movie's description, or why there is none.
 struct Description {
     std::filesystem::path movie;
-    AafRef<IAAFFile> file;   // empty on failure
+    AafRef<IAAFFile> file;  // empty on failure
     NCFRESULT result = NCF_OK;
-    std::string problem;     // for the user, names the movie
+    std::string problem;  // for the user, names the movie
 };
 
 // Opens a movie through the module's container and lets it be described.

@@ -138,8 +138,8 @@ std::filesystem::path DescribeRun::TargetFor(const std::filesystem::path& movie)
 }  // namespace
 
 void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
-    auto* const verb = app.add_subcommand(
-        "describe", "Describe movies as AAF: show the mob tree and save it");
+    auto* const verb =
+        app.add_subcommand("describe", "Describe movies as AAF: show the mob tree and save it");
     verb->footer("Example: cliphost describe clip.mov --aaf clip.aaf");
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();

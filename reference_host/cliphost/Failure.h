@@ -16,7 +16,8 @@ inline constexpr int kExitCaller = 2;  // the caller's fault
 // wrong and what would help.
 class Failure : public std::runtime_error {
 public:
-    Failure(int status, const std::string& message) : std::runtime_error(message), status_(status) {}
+    Failure(int status, const std::string& message)
+        : std::runtime_error(message), status_(status) {}
     int status() const { return status_; }
 
 private:

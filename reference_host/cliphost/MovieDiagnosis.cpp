@@ -103,9 +103,10 @@ std::string DiagnoseMovie(const std::filesystem::path& movie) {
     if (top.atoms.count("moov") == 0) {
         return top.cutAtom.empty()
                    ? "the file holds no movie header ('moov'), so nothing tells its tracks"
-                   : fmt::format("the file ends inside its '{}' atom, before any movie header; "
-                                 "copy it again",
-                                 top.cutAtom);
+                   : fmt::format(
+                         "the file ends inside its '{}' atom, before any movie header; "
+                         "copy it again",
+                         top.cutAtom);
     }
     return "the movie header is there but can't be used: no video or sound track with a known "
            "layout, a length of 0, or tables that do not fit the file; -v shows more";

@@ -56,8 +56,8 @@ FolderFacts Scan(Session& session, const std::filesystem::path& folder) {
 }  // namespace
 
 void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
-    auto* const verb =
-        app.add_subcommand("scan", "Ask the module whether it claims a folder, and list its movies");
+    auto* const verb = app.add_subcommand(
+        "scan", "Ask the module whether it claims a folder, and list its movies");
     verb->footer("Example: cliphost scan ~/Videos");
     auto folder = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);

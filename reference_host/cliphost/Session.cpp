@@ -48,9 +48,8 @@ std::string WithoutLineEnd(std::string text) {
 }  // namespace
 
 Session::Session(const SessionOptions& options) {
-    aaf_ = std::make_unique<AafLibrary>(options.aafLibrary.empty()
-                                            ? options.programFolder / kAAFLibraryName
-                                            : options.aafLibrary);
+    aaf_ = std::make_unique<AafLibrary>(
+        options.aafLibrary.empty() ? options.programFolder / kAAFLibraryName : options.aafLibrary);
     if (!options.pinTime.empty() && !aaf_->PinTime(ParseTime(options.pinTime))) {
         throw Failure(kExitCaller, fmt::format("{}: this AAF library can't pin its time stamps",
                                                DisplayPath(aaf_->file())));
@@ -106,8 +105,8 @@ host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
     const std::filesystem::path absolute =
         std::filesystem::absolute(path, error).lexically_normal();
     if (!error && !std::filesystem::exists(absolute, error)) {
-        throw Failure(kExitCaller, fmt::format("{}: there is no such file or folder",
-                                               DisplayPath(path)));
+        throw Failure(kExitCaller,
+                      fmt::format("{}: there is no such file or folder", DisplayPath(path)));
     }
     if (host::text::HoldsBackslash(absolute)) {
         throw Failure(kExitCaller,

@@ -8,9 +8,9 @@
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/Failure.h"
-#include "reference_host/util/text/HostText.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/util/text/HostText.h"
 
 namespace cliphost {
 
@@ -22,8 +22,7 @@ void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
     verb->callback([&options, json] {
         Session session(options);
         host::Ref<NMA::IMediaContainer3> container;
-        const NCFRESULT made =
-            session.host().Create(NMA::CompID_QuickTimeContainer, container);
+        const NCFRESULT made = session.host().Create(NMA::CompID_QuickTimeContainer, container);
         if (made < 0) {
             throw Failure(kExitCaller, "no container: " + ResultText(made));
         }
@@ -43,7 +42,8 @@ void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
                                 {"group", host::text::ReadUtf8(group.get())}});
             } else {
                 fmt::print("{:2}  {:<6} {:<12} {}\n", i, host::text::ReadUtf8(extension.get()),
-                           host::text::ReadUtf8(description.get()), host::text::ReadUtf8(group.get()));
+                           host::text::ReadUtf8(description.get()),
+                           host::text::ReadUtf8(group.get()));
             }
         }
         if (*json) {

@@ -31,7 +31,8 @@ int main(int argc, char** argv) {
     app.set_version_flag("--version", "cliphost 1.3.2");
     app.add_flag("-v", session.verbosity,
                  "Console lines of the module on standard error; twice for its log too");
-    app.add_option("--plugin", session.plugin, "Another module file than the one beside the program");
+    app.add_option("--plugin", session.plugin,
+                   "Another module file than the one beside the program");
     app.add_option("--aaf-library", session.aafLibrary, "Another build of the AAF library");
 
     double editorRate = 25.0;

@@ -119,7 +119,7 @@ struct FamilyRow {
     const char* name;
 };
 constexpr FamilyRow kFamilies[] = {
-    {"xdv", "XDCAM EX"},  {"xd5", "XDCAM HD422"}, {"xdh", "XDCAM HD 540p"},
+    {"xdv", "XDCAM EX"},      {"xd5", "XDCAM HD422"},  {"xdh", "XDCAM HD 540p"},
     {"ai1", "AVC-Intra 100"}, {"ai5", "AVC-Intra 50"},
 };
 

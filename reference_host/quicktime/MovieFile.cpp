@@ -45,8 +45,7 @@ bool AreStreamsKnown(const AVFormatContext& input) {
 
 }  // namespace
 
-std::unique_ptr<MovieFile> MovieFile::Open(const std::filesystem::path& path,
-                                           std::string& reason) {
+std::unique_ptr<MovieFile> MovieFile::Open(const std::filesystem::path& path, std::string& reason) {
     AVFormatContext* opened = nullptr;
     AVDictionary* options = nullptr;
     // A file that names others, such as a playlist, reaches none of them.

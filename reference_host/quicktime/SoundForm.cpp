@@ -54,7 +54,10 @@ bool ReadLinearKind(AVCodecID codec, SoundForm& form) {
     }
     form.bitsPerChannel = static_cast<ncfUInt32>(av_get_bits_per_sample(codec));
     form.isBigEndian = name.find("be") != std::string_view::npos;
-    form.formatFlags = kPacked | (kind == 'f' ? kFloat : kind == 's' ? kSigned : 0u) |
+    form.formatFlags = kPacked |
+                       (kind == 'f'   ? kFloat
+                        : kind == 's' ? kSigned
+                                      : 0u) |
                        (form.isBigEndian ? kBigEndian : 0u);
     return form.bitsPerChannel > 0;
 }
@@ -91,9 +94,9 @@ bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
         // Only kinds whose packets all have one size tell a size here.
         const bool constant = av_get_bits_per_sample(parameters.codec_id) > 0;
         form.bytesPerPacket =
-            constant ? static_cast<ncfUInt32>(parameters.block_align > 0 ? parameters.block_align
-                                                                         : 0)
-                     : 0;
+            constant
+                ? static_cast<ncfUInt32>(parameters.block_align > 0 ? parameters.block_align : 0)
+                : 0;
         form.framesPerPacket =
             parameters.frame_size > 0 ? static_cast<ncfUInt32>(parameters.frame_size) : 0;
     }

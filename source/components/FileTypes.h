@@ -8,7 +8,7 @@ namespace NMA::Impl {
 
 // One type of file that the plug-in claims.
 struct FileType {
-    ncfUTF16LiteralToUTF16 extension;    // in capitals
+    ncfUTF16LiteralToUTF16 extension;  // in capitals
     ncfUTF16LiteralToUTF16 description;
 };
 

@@ -63,9 +63,8 @@ NCFRESULT QuickTimeMediaVolume::GetMediaFormat(INCFString* path, IMediaFormat** 
         return NCF_E_INVALIDARG;
     }
     return InterfaceEntry([&] {
-        CreateOwnComponent<QuickTimeMediaFormat>(componentFactory_.inArg(),
-                                                 CompID_QuickTimeMediaFormat, IID_IMediaFormat,
-                                                 format)
+        CreateOwnComponent<QuickTimeMediaFormat>(
+            componentFactory_.inArg(), CompID_QuickTimeMediaFormat, IID_IMediaFormat, format)
             .SetVolumePath(path);
         return NCF_OK;
     });

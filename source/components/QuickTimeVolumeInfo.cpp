@@ -104,8 +104,8 @@ NCFRESULT QuickTimeVolumeInfo::GetVolumeName(INCFString** name) {
             slash == std::u16string::npos ? std::u16string() : path.substr(slash + 1);
         NCFSmartPtr<INCFString> result;
         ThrowIfFailed(NMAString::CreateString(result.outArg()));
-        ThrowIfFailed(result->AssignUTF16(kNCFUTF16, last.c_str(),
-                                          static_cast<ncfUInt32>(last.size())));
+        ThrowIfFailed(
+            result->AssignUTF16(kNCFUTF16, last.c_str(), static_cast<ncfUInt32>(last.size())));
         *name = result.detach();
         return NCF_OK;
     });

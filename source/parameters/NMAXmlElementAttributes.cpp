@@ -41,10 +41,9 @@ void NMAXmlElement::SetAttribute(const NMAString& name, const NMAString& value) 
         children_.push_back(attribute.get());
         attribute.release();
     } else {
-        auto* const attribute =
-            found->second < children_.size()
-                ? dynamic_cast<NMAXmlAttribute*>(children_[found->second])
-                : nullptr;
+        auto* const attribute = found->second < children_.size()
+                                    ? dynamic_cast<NMAXmlAttribute*>(children_[found->second])
+                                    : nullptr;
         if (!attribute) {
             ThrowIfFailed(NCF_E_UNEXPECTED);
         }

@@ -107,8 +107,8 @@ void NMAXmlElement::RemoveChildren(const NMAString& name) {
     remove(name, AnyElement);
 }
 
-ncfUInt32 NMAXmlElement::CountChildrenWithAttributes(const NMAString& name,
-                                                     const NMAXmlPair* pairs, ncfSInt32 count) {
+ncfUInt32 NMAXmlElement::CountChildrenWithAttributes(const NMAString& name, const NMAXmlPair* pairs,
+                                                     ncfSInt32 count) {
     std::vector<NMAXmlElement*> found;
     collect(name, ByAttributes(pairs, count), found);
     return SizeOf(found);
@@ -148,8 +148,7 @@ NMAXmlElement* NMAXmlElement::FindChildWithChildren(const NMAString& name, const
 }
 
 void NMAXmlElement::CollectChildrenWithChildren(const NMAString& name, const NMAXmlPair* pairs,
-                                                ncfSInt32 count,
-                                                std::vector<NMAXmlElement*>& out) {
+                                                ncfSInt32 count, std::vector<NMAXmlElement*>& out) {
     collect(name, ByChildren(pairs, count), out);
 }
 

@@ -21,8 +21,8 @@ void RecordAssert(const char* text, const char* function) {
 
 void RecordResult(const char* macro, const char* text, NCFRESULT result, const char* function) {
     slog::Record(slog::kError, function)
-        << macro << "0x" << std::hex << static_cast<ncfUInt32>(result) << ")" << ": " << text
-        << " : " << function;
+        << macro << "0x" << std::hex << static_cast<ncfUInt32>(result) << ")"
+        << ": " << text << " : " << function;
 }
 
 }  // namespace ncf_detail

@@ -15,21 +15,21 @@
 #define NCF_FUNCTION(name) [[maybe_unused]] static constexpr const char ncfFunction[] = name
 
 #define CHK_PTR(x) CHK_PTR_TEXT(#x, x)
-#define CHK_PTR_TEXT(text, x)                          \
-    do {                                               \
-        if (!(x)) {                                    \
+#define CHK_PTR_TEXT(text, x)                              \
+    do {                                                   \
+        if (!(x)) {                                        \
             ncf_detail::RecordCheckPtr(text, ncfFunction); \
-            return NCF_E_POINTER;                      \
-        }                                              \
+            return NCF_E_POINTER;                          \
+        }                                                  \
     } while (false)
 
 #define CHK_INARG(x) CHK_INARG_TEXT(#x, x)
-#define CHK_INARG_TEXT(text, x)                          \
-    do {                                                 \
-        if (!(x)) {                                      \
+#define CHK_INARG_TEXT(text, x)                              \
+    do {                                                     \
+        if (!(x)) {                                          \
             ncf_detail::RecordCheckInArg(text, ncfFunction); \
-            return NCF_E_INVALIDARG;                     \
-        }                                                \
+            return NCF_E_INVALIDARG;                         \
+        }                                                    \
     } while (false)
 
 #define NCFASSERT(x) NCFASSERT_TEXT(#x, x)
@@ -42,20 +42,20 @@
     } while (false)
 
 #define NCF_RETURN(...) NCF_RETURN_TEXT(#__VA_ARGS__, __VA_ARGS__)
-#define NCF_RETURN_TEXT(text, ...)                                            \
-    do {                                                                      \
-        if (const NCFRESULT ncfResult = (__VA_ARGS__); ncfResult < 0) {       \
+#define NCF_RETURN_TEXT(text, ...)                                                 \
+    do {                                                                           \
+        if (const NCFRESULT ncfResult = (__VA_ARGS__); ncfResult < 0) {            \
             ncf_detail::RecordResult("NCF_RETURN(", text, ncfResult, ncfFunction); \
-            return ncfResult;                                                 \
-        }                                                                     \
+            return ncfResult;                                                      \
+        }                                                                          \
     } while (false)
 
 #define NCF_SKIP(...) NCF_SKIP_TEXT(#__VA_ARGS__, __VA_ARGS__)
-#define NCF_SKIP_TEXT(text, ...)                                            \
-    do {                                                                    \
-        if (const NCFRESULT ncfResult = (__VA_ARGS__); ncfResult < 0) {     \
+#define NCF_SKIP_TEXT(text, ...)                                                 \
+    do {                                                                         \
+        if (const NCFRESULT ncfResult = (__VA_ARGS__); ncfResult < 0) {          \
             ncf_detail::RecordResult("NCF_SKIP(", text, ncfResult, ncfFunction); \
-        }                                                                   \
+        }                                                                        \
     } while (false)
 
 // Throws a failure as an NCFRESULT: used inside the try block of an interface

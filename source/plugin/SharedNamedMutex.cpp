@@ -26,8 +26,8 @@ const char* TextOf(os::Wait outcome) {
 
 SharedNamedMutex::SharedNamedMutex(const char* name) : handle_(os::CreateNamedMutex(name)) {
     if (!handle_) {
-        std::cout << "Error create shared mutex" << (name ? name : "") << "err: "
-                  << os::ErrorText(os::LastError()) << std::endl;
+        std::cout << "Error create shared mutex" << (name ? name : "")
+                  << "err: " << os::ErrorText(os::LastError()) << std::endl;
     }
 }
 
@@ -49,8 +49,8 @@ void SharedNamedMutex::Lock() {
         return;
     }
     const ncfUInt32 error = os::LastError();
-    std::cout << TextOf(outcome) << "Lock shared mutex: " << handle_ << "; code: "
-              << os::ErrorText(error) << std::endl;
+    std::cout << TextOf(outcome) << "Lock shared mutex: " << handle_
+              << "; code: " << os::ErrorText(error) << std::endl;
 }
 
 void SharedNamedMutex::Unlock() {

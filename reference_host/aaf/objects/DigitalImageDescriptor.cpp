@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/aaf/objects/DigitalImageDescriptor.h"
 
+#include "reference_host/aaf/objects/Arrays.h"
+
 namespace aaf {
 
 namespace {
@@ -104,17 +106,13 @@ HRESULT DigitalImageDescriptor::SetVideoLineMap(aafUInt32 numberElements, aafInt
 }
 
 HRESULT DigitalImageDescriptor::GetVideoLineMap(aafUInt32 numberElements, aafInt32* videoLineMap) {
-    return ReadNative(prop::DigitalImageDescriptor_VideoLineMap, videoLineMap,
-                      std::size_t{numberElements} * sizeof *videoLineMap);
+    return ReadArray(*this, prop::DigitalImageDescriptor_VideoLineMap, videoLineMap,
+                     std::size_t{numberElements} * sizeof *videoLineMap);
 }
 
 HRESULT DigitalImageDescriptor::GetVideoLineMapSize(aafUInt32* numberElements) {
-    const HRESULT result =
-        ReadNativeSize(prop::DigitalImageDescriptor_VideoLineMap, numberElements);
-    if (result >= 0) {
-        *numberElements /= sizeof(aafInt32);
-    }
-    return result;
+    return CountElements(*this, prop::DigitalImageDescriptor_VideoLineMap, sizeof(aafInt32),
+                         numberElements);
 }
 
 HRESULT DigitalImageDescriptor::SetFieldDominance(aafFieldNumber_t fieldDominance) {

@@ -237,6 +237,9 @@ HRESULT File::SaveCopyAs(IAAFFile* destFile) {
     if (target->access_ == Access::Read) {
         return AAFRESULT_WRONG_OPENMODE;
     }
+    if (OpenStorage() == nullptr || target->OpenStorage() == nullptr) {
+        return AAFRESULT_OBJECT_NOT_FOUND;
+    }
     if (target == this || target->OpenStorage()->MobCount() > 0) {
         return AAFRESULT_OPERATION_NOT_PERMITTED;
     }

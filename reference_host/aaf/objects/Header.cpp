@@ -56,49 +56,60 @@ void Header::Touch() {
     PutStruct(prop::Header_LastModified, CurrentTime());
 }
 
+template <class Operation>
+HRESULT Header::OnContent(Operation operation) const {
+    ContentStorage* const storage = content();
+    return storage == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : operation(*storage);
+}
+
 HRESULT Header::LookupMob(aafMobID_constref mobID, IAAFMob** mob) {
-    return content()->LookupMob(mobID, mob);
+    return OnContent([&](ContentStorage& storage) { return storage.LookupMob(mobID, mob); });
 }
 
 HRESULT Header::CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) {
-    return content()->CountMobs(mobKind, result);
+    return OnContent([&](ContentStorage& storage) { return storage.CountMobs(mobKind, result); });
 }
 
 HRESULT Header::GetMobs(aafSearchCrit_t* searchCriteria, IEnumAAFMobs** enumerator) {
-    return content()->GetMobs(searchCriteria, enumerator);
+    return OnContent(
+        [&](ContentStorage& storage) { return storage.GetMobs(searchCriteria, enumerator); });
 }
 
 HRESULT Header::AddMob(IAAFMob* mob) {
-    return content()->AddMob(mob);
+    return OnContent([&](ContentStorage& storage) { return storage.AddMob(mob); });
 }
 
 HRESULT Header::RemoveMob(IAAFMob* mob) {
-    return content()->RemoveMob(mob);
+    return OnContent([&](ContentStorage& storage) { return storage.RemoveMob(mob); });
 }
 
 HRESULT Header::CountEssenceData(aafUInt32* result) {
-    return content()->CountEssenceData(result);
+    return OnContent([&](ContentStorage& storage) { return storage.CountEssenceData(result); });
 }
 
 HRESULT Header::IsEssenceDataPresent(aafMobID_constref fileMobID, aafFileFormat_t fmt,
                                      aafBoolean_t* result) {
-    return content()->IsEssenceDataPresent(fileMobID, fmt, result);
+    return OnContent([&](ContentStorage& storage) {
+        return storage.IsEssenceDataPresent(fileMobID, fmt, result);
+    });
 }
 
 HRESULT Header::EnumEssenceData(IEnumAAFEssenceData** enumerator) {
-    return content()->EnumEssenceData(enumerator);
+    return OnContent([&](ContentStorage& storage) { return storage.EnumEssenceData(enumerator); });
 }
 
 HRESULT Header::AddEssenceData(IAAFEssenceData* essenceData) {
-    return content()->AddEssenceData(essenceData);
+    return OnContent([&](ContentStorage& storage) { return storage.AddEssenceData(essenceData); });
 }
 
 HRESULT Header::RemoveEssenceData(IAAFEssenceData* essenceData) {
-    return content()->RemoveEssenceData(essenceData);
+    return OnContent(
+        [&](ContentStorage& storage) { return storage.RemoveEssenceData(essenceData); });
 }
 
 HRESULT Header::LookupEssenceData(aafMobID_constref mobID, IAAFEssenceData** essenceData) {
-    return content()->LookupEssenceData(mobID, essenceData);
+    return OnContent(
+        [&](ContentStorage& storage) { return storage.LookupEssenceData(mobID, essenceData); });
 }
 
 HRESULT Header::GetLastIdentification(IAAFIdentification** identification) {

@@ -17,7 +17,7 @@ public:
     // Makes content and values of a new file; not for one that is read.
     void SetDefaults() override;
 
-    // Null only in a damaged file.
+    // Null when a caller has removed it.
     ContentStorage* content() const;
     // Appends an identification of the program that is about to write.
     HRESULT AddIdentification(const aafProductIdentification_t& product);
@@ -57,6 +57,10 @@ public:
     HRESULT GetNativeByteOrder(eAAFByteOrder_t* order) override;
     HRESULT GetOperationalPattern(aafUID_t* operationalPatternID) override;
     HRESULT SetOperationalPattern(aafUID_constref operationalPatternID) override;
+
+private:
+    template <class Operation>
+    HRESULT OnContent(Operation operation) const;
 };
 
 // This library's own version, as the header and the exports tell it.

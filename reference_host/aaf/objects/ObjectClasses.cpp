@@ -4,9 +4,11 @@
 
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "reference_host/aaf/model/Model.h"
+#include "reference_host/aaf/objects/BWFImportDescriptor.h"
 #include "reference_host/aaf/objects/CDCIDescriptor.h"
 #include "reference_host/aaf/objects/CompositionMob.h"
 #include "reference_host/aaf/objects/ContentStorage.h"
+#include "reference_host/aaf/objects/Descriptive.h"
 #include "reference_host/aaf/objects/EssenceData.h"
 #include "reference_host/aaf/objects/Header.h"
 #include "reference_host/aaf/objects/Identification.h"
@@ -26,6 +28,7 @@
 #include "reference_host/aaf/objects/SourceMob.h"
 #include "reference_host/aaf/objects/TaggedValue.h"
 #include "reference_host/aaf/objects/Timecode.h"
+#include "reference_host/aaf/objects/TimecodeStream.h"
 
 namespace aaf {
 
@@ -93,6 +96,14 @@ const ClassEntry kClasses[] = {
     {AUID_AAFContentStorage, &CreateAs<ContentStorage>},
     {AUID_AAFIdentification, &CreateAs<Identification>},
     {AUID_AAFEssenceData, &CreateAs<EssenceData>},
+    {AUID_AAFTimecodeStream, &CreateAs<TimecodeStream>},
+    {AUID_AAFTimecodeStream12M, &CreateAs<TimecodeStream12M>},
+    {AUID_AAFDescriptiveObject, &CreateAs<DescriptiveObject>},
+    {AUID_AAFDescriptiveFramework, &CreateAs<DescriptiveFramework>},
+    {AUID_AAFDescriptiveMarker, &CreateAs<DescriptiveMarker>},
+    {AUID_AAFDescriptiveClip, &CreateAs<DescriptiveClip>},
+    {AUID_AAFRIFFChunk, &CreateAs<RIFFChunk>},
+    {AUID_AAFBWFImportDescriptor, &CreateAs<BWFImportDescriptor>},
 };
 
 }  // namespace

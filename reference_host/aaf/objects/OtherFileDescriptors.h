@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "reference_host/aaf/objects/Arrays.h"
 #include "reference_host/aaf/objects/Checks.h"
 #include "reference_host/aaf/objects/FileDescriptor.h"
 
@@ -14,7 +15,7 @@ class AIFCDescriptor : public Implements<FileDescriptor, IAAFAIFCDescriptor> {
 public:
     HRESULT Initialize() override { return AAFRESULT_SUCCESS; }
     HRESULT GetSummary(aafUInt32 size, aafDataValue_t summary) override {
-        return ReadNative(prop::AIFCDescriptor_Summary, summary, size);
+        return ReadArray(*this, prop::AIFCDescriptor_Summary, summary, size);
     }
     HRESULT GetSummaryBufferSize(aafUInt32* size) override {
         return ReadNativeSize(prop::AIFCDescriptor_Summary, size);
@@ -28,7 +29,7 @@ class WAVEDescriptor : public Implements<FileDescriptor, IAAFWAVEDescriptor> {
 public:
     HRESULT Initialize() override { return AAFRESULT_SUCCESS; }
     HRESULT GetSummary(aafUInt32 size, aafDataValue_t summary) override {
-        return ReadNative(prop::WAVEDescriptor_Summary, summary, size);
+        return ReadArray(*this, prop::WAVEDescriptor_Summary, summary, size);
     }
     HRESULT GetSummaryBufferSize(aafUInt32* size) override {
         return ReadNativeSize(prop::WAVEDescriptor_Summary, size);
@@ -41,7 +42,7 @@ public:
 class TIFFDescriptor : public Implements<FileDescriptor, IAAFTIFFDescriptor> {
 public:
     HRESULT GetSummary(aafUInt32 size, aafDataValue_t summary) override {
-        return ReadNative(prop::TIFFDescriptor_Summary, summary, size);
+        return ReadArray(*this, prop::TIFFDescriptor_Summary, summary, size);
     }
     HRESULT GetSummaryBufferSize(aafUInt32* size) override {
         return ReadNativeSize(prop::TIFFDescriptor_Summary, size);

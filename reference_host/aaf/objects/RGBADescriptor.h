@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "reference_host/aaf/objects/Arrays.h"
 #include "reference_host/aaf/objects/DigitalImageDescriptor.h"
 
 namespace aaf {
@@ -24,7 +25,7 @@ public:
         return PutNative(prop::RGBADescriptor_Palette, palette, numberElements);
     }
     HRESULT GetPalette(aafUInt32 numberRecords, aafUInt8* palette) override {
-        return ReadNative(prop::RGBADescriptor_Palette, palette, numberRecords);
+        return ReadArray(*this, prop::RGBADescriptor_Palette, palette, numberRecords);
     }
     HRESULT GetPaletteSize(aafUInt32* numberBytes) override {
         return ReadNativeSize(prop::RGBADescriptor_Palette, numberBytes);

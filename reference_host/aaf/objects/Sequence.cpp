@@ -54,10 +54,21 @@ aafLength_t LengthOf(const Component& component) {
     return component.IntegerOr(prop::Component_Length, 0);
 }
 
-// What a component adds to the sequence: a transition lies over its neighbours
-// and so shortens it.
-aafLength_t LengthAdded(const Component& component) {
-    return IsTransition(&component) ? -LengthOf(component) : LengthOf(component);
+// A sequence's length with a component more: a transition lies over its
+// neighbours and so shortens it. False when that is no length.
+bool AddLength(aafLength_t length, const Component& component, aafLength_t& sum) {
+    const bool overflow = IsTransition(&component)
+                              ? __builtin_sub_overflow(length, LengthOf(component), &sum)
+                              : __builtin_add_overflow(length, LengthOf(component), &sum);
+    return !overflow && sum >= 0;
+}
+
+// The same with a component less.
+bool SubtractLength(aafLength_t length, const Component& component, aafLength_t& rest) {
+    const bool overflow = IsTransition(&component)
+                              ? __builtin_add_overflow(length, LengthOf(component), &rest)
+                              : __builtin_sub_overflow(length, LengthOf(component), &rest);
+    return !overflow && rest >= 0;
 }
 
 }  // namespace
@@ -147,8 +158,7 @@ HRESULT Sequence::InsertComponentAt(aafUInt32 index, IAAFComponent* component) {
         return AAFRESULT_PROP_NOT_PRESENT;
     }
     aafLength_t sum = 0;
-    const aafLength_t before = LengthOf(*this);
-    if (__builtin_add_overflow(before, LengthAdded(*added), &sum) || sum < 0) {
+    if (!AddLength(LengthOf(*this), *added, sum)) {
         return AAFRESULT_BAD_LENGTH;
     }
     result = InsertObjectAt(prop::Sequence_Components, index, component);
@@ -165,7 +175,7 @@ HRESULT Sequence::RemoveComponentAt(aafUInt32 index) {
         return AAFRESULT_BADINDEX;
     }
     aafLength_t rest = 0;
-    if (__builtin_sub_overflow(LengthOf(*this), LengthAdded(*removed), &rest) || rest < 0) {
+    if (!SubtractLength(LengthOf(*this), *removed, rest)) {
         rest = 0;  // the length was set by hand and no longer the sum
     }
     const HRESULT result = RemoveObjectAt(prop::Sequence_Components, index);

@@ -3,23 +3,12 @@
 #include "reference_host/aaf/objects/SourceClip.h"
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
+#include "reference_host/aaf/objects/Arrays.h"
 #include "reference_host/aaf/objects/Checks.h"
 #include "reference_host/aaf/objects/ContentStorage.h"
 #include "reference_host/aaf/objects/MobId.h"
 
 namespace aaf {
-
-namespace {
-
-HRESULT ReadElementCount(const Object& object, const PropertyKey& key, aafUInt32* count) {
-    const HRESULT result = object.ReadNativeSize(key, count);
-    if (result >= 0) {
-        *count /= sizeof(aafUInt32);
-    }
-    return result;
-}
-
-}  // namespace
 
 void SourceReference::SetDefaults() {
     Segment::SetDefaults();
@@ -48,12 +37,12 @@ HRESULT SourceReference::SetChannelIDs(aafUInt32 numberElements, aafUInt32* chan
 }
 
 HRESULT SourceReference::GetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) {
-    return ReadNative(prop::SourceReference_ChannelIDs, channelIDs,
-                      std::size_t{numberElements} * sizeof *channelIDs);
+    return ReadArray(*this, prop::SourceReference_ChannelIDs, channelIDs,
+                     std::size_t{numberElements} * sizeof *channelIDs);
 }
 
 HRESULT SourceReference::GetChannelIDsSize(aafUInt32* size) {
-    return ReadElementCount(*this, prop::SourceReference_ChannelIDs, size);
+    return CountElements(*this, prop::SourceReference_ChannelIDs, sizeof(aafUInt32), size);
 }
 
 HRESULT SourceReference::SetMonoSourceSlotIDs(aafUInt32 numberElements,
@@ -64,12 +53,12 @@ HRESULT SourceReference::SetMonoSourceSlotIDs(aafUInt32 numberElements,
 
 HRESULT SourceReference::GetMonoSourceSlotIDs(aafUInt32 numberElements,
                                               aafUInt32* monoSourceSlotIDs) {
-    return ReadNative(prop::SourceReference_MonoSourceSlotIDs, monoSourceSlotIDs,
-                      std::size_t{numberElements} * sizeof *monoSourceSlotIDs);
+    return ReadArray(*this, prop::SourceReference_MonoSourceSlotIDs, monoSourceSlotIDs,
+                     std::size_t{numberElements} * sizeof *monoSourceSlotIDs);
 }
 
 HRESULT SourceReference::GetMonoSourceSlotIDsSize(aafUInt32* size) {
-    return ReadElementCount(*this, prop::SourceReference_MonoSourceSlotIDs, size);
+    return CountElements(*this, prop::SourceReference_MonoSourceSlotIDs, sizeof(aafUInt32), size);
 }
 
 HRESULT SourceClip::Initialize(IAAFDataDef* dataDef, aafLength_constref length,

@@ -119,7 +119,7 @@ bool GetSectorSize(FileHandle file, const std::u16string&, ncfUInt32* bytes) {
         return Fail(errno);
     }
     // Network file systems name a megabyte: that is no sector.
-    const unsigned long size = volume.f_bsize;
+    const ncfUInt64 size = volume.f_bsize;
     if (size < 512 || size > 65536 || (size & (size - 1)) != 0) {
         return Fail(ERANGE);
     }
@@ -210,9 +210,11 @@ bool GetModulePath(const void* address, std::wstring* path) {
     path->clear();
     for (std::size_t i = 0; i < name.size();) {
         const auto byte = static_cast<unsigned char>(name[i]);
-        const int length = byte < 0x80 ? 1 : byte >> 5 == 6 ? 2 : byte >> 4 == 14 ? 3
-                                             : byte >> 3 == 30                    ? 4
-                                                                                  : 0;
+        const int length = byte < 0x80       ? 1
+                           : byte >> 5 == 6  ? 2
+                           : byte >> 4 == 14 ? 3
+                           : byte >> 3 == 30 ? 4
+                                             : 0;
         char32_t c = length == 1 ? byte : byte & (0x7Fu >> length);
         bool valid = length > 0 && i + static_cast<std::size_t>(length) <= name.size();
         for (int k = 1; valid && k < length; ++k) {
@@ -257,8 +259,8 @@ void* CreateNamedMutex(const char* name) {
     void* memory = MAP_FAILED;
     // Whoever locks the file first makes the mutex; the others find it made.
     if (lockf(descriptor, F_LOCK, 0) == 0 && ftruncate(descriptor, sizeof(SharedMutex)) == 0) {
-        memory = mmap(nullptr, sizeof(SharedMutex), PROT_READ | PROT_WRITE, MAP_SHARED,
-                      descriptor, 0);
+        memory =
+            mmap(nullptr, sizeof(SharedMutex), PROT_READ | PROT_WRITE, MAP_SHARED, descriptor, 0);
     }
     if (memory == MAP_FAILED) {
         Fail(errno);

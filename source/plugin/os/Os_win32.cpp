@@ -47,8 +47,8 @@ bool GetFileSize(FileHandle file, ncfUInt64* size) {
 
 bool GetSectorSize(FileHandle, const std::u16string& volumeRoot, ncfUInt32* bytes) {
     DWORD size = 0;
-    if (volumeRoot.empty() || !::GetDiskFreeSpaceW(Wide(volumeRoot), nullptr, &size, nullptr, nullptr) ||
-        size == 0) {
+    if (volumeRoot.empty() ||
+        !::GetDiskFreeSpaceW(Wide(volumeRoot), nullptr, &size, nullptr, nullptr) || size == 0) {
         return false;
     }
     *bytes = size;
@@ -93,8 +93,8 @@ bool GetModulePath(const void* address, std::wstring* path) {
     HMODULE module = nullptr;
     // The reference that this look-up adds is never given back: once started,
     // the module stays mapped.
-    if (!::GetModuleHandleExA(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS,
-                              static_cast<LPCSTR>(address), &module)) {
+    if (!::GetModuleHandleExA(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS, static_cast<LPCSTR>(address),
+                              &module)) {
         return false;
     }
     wchar_t buffer[260] = {};
@@ -148,9 +148,9 @@ ncfUInt64 CurrentThreadId() {
 
 const void* OwnModule() {
     HMODULE module = nullptr;
-    ::GetModuleHandleExA(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS |
-                             GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
-                         reinterpret_cast<LPCSTR>(&OwnModule), &module);
+    ::GetModuleHandleExA(
+        GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS | GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
+        reinterpret_cast<LPCSTR>(&OwnModule), &module);
     return module;
 }
 

@@ -42,10 +42,9 @@ NCFRESULT FakeConsole::Write(ncfUInt32 level, const char* format, ...) {
 }
 
 int FakeConsole::count(ncfUInt32 level, const std::string& text) const {
-    return static_cast<int>(
-        std::count_if(lines_.begin(), lines_.end(), [&](const Line& line) {
-            return line.level == level && line.text == text;
-        }));
+    return static_cast<int>(std::count_if(lines_.begin(), lines_.end(), [&](const Line& line) {
+        return line.level == level && line.text == text;
+    }));
 }
 
 class FakeHost::Unknown : public FakeObject<INCFComponentFactory> {

@@ -11,8 +11,9 @@ int Journal::count(const std::string& line) const {
 
 std::vector<std::string> Journal::startingWith(const std::string& start) const {
     std::vector<std::string> found;
-    std::copy_if(lines_.begin(), lines_.end(), std::back_inserter(found),
-                 [&](const std::string& line) { return line.compare(0, start.size(), start) == 0; });
+    std::copy_if(
+        lines_.begin(), lines_.end(), std::back_inserter(found),
+        [&](const std::string& line) { return line.compare(0, start.size(), start) == 0; });
     return found;
 }
 

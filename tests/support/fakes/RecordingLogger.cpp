@@ -29,9 +29,7 @@ public:
     void WriteUInt32(ncfUInt32 value) override { text_ << value; }
     void WriteSInt32(ncfSInt32 value) override { text_ << value; }
     void WriteString(const char* text) override { text_ << (text ? text : "(null)"); }
-    void Manipulate(std::ios_base& (*manipulator)(std::ios_base&)) override {
-        manipulator(text_);
-    }
+    void Manipulate(std::ios_base& (*manipulator)(std::ios_base&)) override { manipulator(text_); }
     void EndRecord() override {
         record_.text = text_.str();
         if (recordJournal) {

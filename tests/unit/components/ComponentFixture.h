@@ -48,8 +48,9 @@ protected:
     NCFSmartPtr<Interface> make(CreationFunction creator) {
         NCFSmartPtr<Interface> object;
         void* made = nullptr;
-        EXPECT_EQ(creator(host.unknown(), nullptr, ncfIdOf(static_cast<Interface*>(nullptr)), &made),
-                  NCF_OK);
+        EXPECT_EQ(
+            creator(host.unknown(), nullptr, ncfIdOf(static_cast<Interface*>(nullptr)), &made),
+            NCF_OK);
         object.attach(static_cast<Interface*>(made));
         return object;
     }

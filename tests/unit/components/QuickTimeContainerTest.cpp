@@ -109,9 +109,9 @@ TEST_F(Container, TellsItsCapabilitiesByTheHostsPreference) {
 
 TEST_F(Container, ListsItsFileTypes) {
     const char* const extensions[] = {
-        "MOV", "MP4", "M4V", "MPG", "MPE",  "MPEG", "M2T",  "3GP", "3G2",  "QT",  "MOOV", "MOVIE",
-        "AVI", "TXT", "MP2", "MP3", "M4A",  "WAV",  "AIFF", "AIF", "AU",   "AAC", "MID",  "MPA",
-        "GIF", "JPG", "JPEG", "JFIF", "TIF", "TIFF", "PNG", "BMP", "PSD",  "DV"};
+        "MOV", "MP4", "M4V",  "MPG",  "MPE", "MPEG", "M2T",  "3GP", "3G2", "QT",  "MOOV", "MOVIE",
+        "AVI", "TXT", "MP2",  "MP3",  "M4A", "WAV",  "AIFF", "AIF", "AU",  "AAC", "MID",  "MPA",
+        "GIF", "JPG", "JPEG", "JFIF", "TIF", "TIFF", "PNG",  "BMP", "PSD", "DV"};
     const auto object = container();
     ASSERT_EQ(object->GetFileTypeCount(), std::size(extensions));
     for (ncfUInt32 i = 0; i < std::size(extensions); ++i) {

@@ -28,9 +28,7 @@ protected:
         std::sort(paths.begin(), paths.end());
         return paths;
     }
-    std::string fullPath(const std::string& name) {
-        return TextOf(path(folder / name).inArg());
-    }
+    std::string fullPath(const std::string& name) { return TextOf(path(folder / name).inArg()); }
 };
 
 TEST_F(MediaFormat, GivesItsFlags) {
@@ -119,8 +117,8 @@ TEST_F(MasterClips, GivesTheFailureOfALoadAndLeavesTheOutput) {
     IAAFFile* file = before;
     EXPECT_EQ(clips->GetMetadata(0, &file), NMA_E_NOTINITIALIZED) << "no header parser is there";
     EXPECT_EQ(file, before);
-    EXPECT_TRUE(log.contains(
-        "LoadMedia(_MCList[index].InArg(), _pConsole, _pComponentFactory, media)"));
+    EXPECT_TRUE(
+        log.contains("LoadMedia(_MCList[index].InArg(), _pConsole, _pComponentFactory, media)"));
 }
 
 TEST_F(MasterClips, GivesTheCodeOfAFileThatIsGone) {

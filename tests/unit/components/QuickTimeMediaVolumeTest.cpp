@@ -107,9 +107,9 @@ TEST_F(MediaVolume, NeedsAHostWithAFactory) {
     EXPECT_EQ(NMA::Impl::CreateQuickTimeMediaVolume(nullptr, nullptr, NMA::IID_IMediaVolume, &out),
               NCF_E_POINTER);
     host.refuseQuery(IID_INCFComponentFactory, NCF_E_NOINTERFACE);
-    EXPECT_EQ(NMA::Impl::CreateQuickTimeMediaVolume(host.unknown(), nullptr, NMA::IID_IMediaVolume,
-                                                    &out),
-              NCF_E_NOINTERFACE);
+    EXPECT_EQ(
+        NMA::Impl::CreateQuickTimeMediaVolume(host.unknown(), nullptr, NMA::IID_IMediaVolume, &out),
+        NCF_E_NOINTERFACE);
     EXPECT_EQ(out, nullptr);
 }
 

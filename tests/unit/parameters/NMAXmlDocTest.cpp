@@ -65,8 +65,9 @@ TEST_F(XmlDocument, CreatesARootOnce) {
 
 TEST_F(XmlDocument, ComesOutAsItWentInButForCdata) {
     Doc doc(host.factory());
-    doc.LoadFromString(S("<a x=\"1\" y=\"&lt;&quot;\"><b>text &amp; more</b><c><d/>tail</c>"
-                         "<e><![CDATA[lost]]></e></a>"));
+    doc.LoadFromString(
+        S("<a x=\"1\" y=\"&lt;&quot;\"><b>text &amp; more</b><c><d/>tail</c>"
+          "<e><![CDATA[lost]]></e></a>"));
     const std::string saved = Saved(doc);
     EXPECT_EQ(saved.find("lost"), std::string::npos);
     Doc again(host.factory());

@@ -77,8 +77,8 @@ TEST_F(Component, RefusesAnUnknownInterfaceAndNullsTheOutput) {
     void* out = reinterpret_cast<void*>(&host);
     EXPECT_EQ(create(IID_LockComponent, &out), NCF_E_NOINTERFACE);
     EXPECT_EQ(out, nullptr);
-    EXPECT_EQ(journal.lines(), (std::vector<std::string>{"made", "initialized", "final release",
-                                                         "destroyed"}));
+    EXPECT_EQ(journal.lines(),
+              (std::vector<std::string>{"made", "initialized", "final release", "destroyed"}));
 }
 
 TEST_F(Component, IsDestroyedWithoutFinalReleaseWhenInitializingFails) {
@@ -152,9 +152,9 @@ TEST_F(Component, ClassFactoryRefusesAnInterfaceAndIsDestroyed) {
 TEST_F(Component, ClassFactoryNeedsACreatorAndAnOutput) {
     void* out = nullptr;
     EXPECT_EQ(CNCFClassFactory::Create(nullptr, IID_INCFClassFactory, &out), NCF_E_INVALIDARG);
-    EXPECT_EQ(CNCFClassFactory::Create(&CreateInstanceOf<TestComponent>, IID_INCFClassFactory,
-                                       nullptr),
-              NCF_E_INVALIDARG);
+    EXPECT_EQ(
+        CNCFClassFactory::Create(&CreateInstanceOf<TestComponent>, IID_INCFClassFactory, nullptr),
+        NCF_E_INVALIDARG);
 }
 
 TEST_F(Component, ClassFactoryRefusesItsQueryWithoutOutput) {

@@ -41,12 +41,12 @@ void ShutDownInfoRetriever() {
 }
 
 namespace NMA::Impl {
-#define STAND_IN(Name)                                                                       \
-    NCFRESULT Name(INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out) {     \
-        if (stubJournal) {                                                                   \
-            stubJournal->add(#Name);                                                         \
-        }                                                                                    \
-        return CreateInstanceOf<TestComponent>(host, outer, iid, out);                       \
+#define STAND_IN(Name)                                                                   \
+    NCFRESULT Name(INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out) { \
+        if (stubJournal) {                                                               \
+            stubJournal->add(#Name);                                                     \
+        }                                                                                \
+        return CreateInstanceOf<TestComponent>(host, outer, iid, out);                   \
     }
 STAND_IN(CreateQuickTimeContainer)
 STAND_IN(CreateQuickTimeMediaVolume)
@@ -60,8 +60,7 @@ namespace {
 
 std::string TextOfGuid(const GUID& id) {
     char text[40];
-    std::snprintf(text, sizeof text,
-                  "%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X",
+    std::snprintf(text, sizeof text, "%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X",
                   static_cast<unsigned>(id.Data1), id.Data2, id.Data3, id.Data4[0], id.Data4[1],
                   id.Data4[2], id.Data4[3], id.Data4[4], id.Data4[5], id.Data4[6], id.Data4[7]);
     return text;
@@ -232,8 +231,8 @@ constexpr ExpectedComponent kExpected[] = {
      "C5D1D369-62EF-46F8-84B8-1700F1153100", "1.3", false},
     {"GenericDocumentHandler", "4E40C813-86AD-4275-92CC-3AAB04EB1689",
      "A235C6D4-35F8-4A18-8CD1-7E96A8EBF842", "1.3", true},
-    {"QTParameters", "E01FB758-46AA-479F-BADA-1FB47C8D522C",
-     "5ECB2244-6B8F-41FD-9E36-71EAE5501230", "1.3", false},
+    {"QTParameters", "E01FB758-46AA-479F-BADA-1FB47C8D522C", "5ECB2244-6B8F-41FD-9E36-71EAE5501230",
+     "1.3", false},
 };
 
 TEST_F(EntryPoints, RegisterEveryComponentWithItsRowBetweenTheAttributes) {
@@ -308,10 +307,15 @@ TEST_F(EntryPoints, TurnAnythingElseThatIsThrownIntoUnexpected) {
 // --- class factories -------------------------------------------------------------
 
 TEST_F(EntryPoints, GiveAClassFactoryForEveryClassThatIsServed) {
-    const char* const creators[] = {
-        "CreateQuickTimeMediaVolume", "CreateQuickTimeMediaFormat", "CreateQuickTimeMasterClips",
-        "CreateQuickTimeVolumeInfo",  "CreateQuickTimeContainer",   nullptr,
-        nullptr,                      "CreateGenericDocHandler",    nullptr};
+    const char* const creators[] = {"CreateQuickTimeMediaVolume",
+                                    "CreateQuickTimeMediaFormat",
+                                    "CreateQuickTimeMasterClips",
+                                    "CreateQuickTimeVolumeInfo",
+                                    "CreateQuickTimeContainer",
+                                    nullptr,
+                                    nullptr,
+                                    "CreateGenericDocHandler",
+                                    nullptr};
     for (ncfUInt32 index = 0; index < kComponentCount; ++index) {
         journal.clear();
         void* out = reinterpret_cast<void*>(&host);
@@ -422,9 +426,8 @@ TEST_F(EntryPoints, ShutdownClearsTheFolderThenTheRetrieverThenSaysUnloaded) {
     journal.clear();
     RecordingNMALog log(8, &journal);
     EXPECT_EQ(NCFShutdown(host.unknown()), NCF_OK);
-    EXPECT_EQ(journal.lines(),
-              (std::vector<std::string>{"retriever down, folder cleared",
-                                        "log 4: QuickTime Plug-In Unloaded"}));
+    EXPECT_EQ(journal.lines(), (std::vector<std::string>{"retriever down, folder cleared",
+                                                         "log 4: QuickTime Plug-In Unloaded"}));
     EXPECT_EQ(GetPluginFolder(), nullptr);
 }
 

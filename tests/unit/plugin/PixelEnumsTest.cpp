@@ -34,9 +34,8 @@ TEST(PixelEnums, NameEveryComponentType) {
 
 TEST(PixelEnums, NameEveryPixelLayout) {
     const std::pair<ncfUInt32, const wchar_t*> rows[] = {
-        {2, L"PF_CbYCrY"}, {4, L"PF_ARGB"},       {8, L"PF_BGRA"},
-        {64, L"PF_RGB"},   {1024, L"PF_Mono"},    {2048, L"PF_RGBA"},
-        {1, L"PF_UNDEFINED"}, {0x7FFFFFFF, L"PF_UNDEFINED"},
+        {2, L"PF_CbYCrY"},  {4, L"PF_ARGB"},    {8, L"PF_BGRA"},      {64, L"PF_RGB"},
+        {1024, L"PF_Mono"}, {2048, L"PF_RGBA"}, {1, L"PF_UNDEFINED"}, {0x7FFFFFFF, L"PF_UNDEFINED"},
     };
     for (const auto& [value, text] : rows) {
         EXPECT_STREQ(PixelLayoutToString(value), text) << value;

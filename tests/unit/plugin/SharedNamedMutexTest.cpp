@@ -46,9 +46,15 @@ TEST_F(NamedMutex, KeepsOtherThreadsOut) {
 }
 
 TEST_F(NamedMutex, IsGivenBackByItsDestructor) {
-    { SharedNamedMutex mutex(name.c_str()); mutex.Lock(); }
+    {
+        SharedNamedMutex mutex(name.c_str());
+        mutex.Lock();
+    }
     SharedNamedMutex mutex(name.c_str());
-    std::thread([&] { mutex.Lock(); mutex.Unlock(); }).join();
+    std::thread([&] {
+        mutex.Lock();
+        mutex.Unlock();
+    }).join();
 }
 
 TEST_F(NamedMutex, TellsOfAnOwnerThatDied) {

@@ -10,11 +10,11 @@ protected:
         return model->NewObject<aaf::Object>(classId);
     }
     aaf::RefPtr<aaf::Object> MobNumber(unsigned char number) {
-        const auto mob = Make(AUID_AAFMasterMob);
+        const auto made = Make(AUID_AAFMasterMob);
         aafMobID_t id{};
         id.SMPTELabel[0] = number;
-        mob->PutStruct(aaf::prop::Mob_MobID, id);
-        return mob;
+        made->PutStruct(aaf::prop::Mob_MobID, id);
+        return made;
     }
     const aaf::PropertyKey& slots = aaf::prop::Mob_Slots;
     aaf::RefPtr<aaf::Object> mob = Make(AUID_AAFMasterMob);

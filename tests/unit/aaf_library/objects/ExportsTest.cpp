@@ -68,7 +68,7 @@ TEST(Exports, NameResults) {
     EXPECT_EQ(L"AAFRESULT_NOT_IMPLEMENTED: The operation is not implemented.",
               ResultText(AAFRESULT_NOT_IMPLEMENTED));
     // Known, but not of this library.
-    EXPECT_EQ(L"AAFRESULT_BADQTABLE", ResultText(static_cast<AAFRESULT>(0x801200A5u)));
+    EXPECT_EQ(L"AAFRESULT_BADQTABLE", ResultText(static_cast<AAFRESULT>(0x801200A4u)));
 }
 
 TEST(Exports, RefuseResultsThatTheyDoNotKnow) {

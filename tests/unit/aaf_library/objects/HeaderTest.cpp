@@ -336,6 +336,24 @@ TEST_F(Header, KeepsEssenceUnderTheIdOfItsFileMob) {
     EXPECT_EQ(AAFRESULT_ESSENCE_NOT_FOUND, header_->LookupEssenceData(MobId(1), found.Out()));
 }
 
+TEST_F(Header, AnswersWithAFailureWhenItsContentWasRemoved) {
+    Ptr<IAAFObject> object = As<IAAFObject>(header_);
+    Ptr<IAAFClassDef> definition;
+    Ptr<IAAFPropertyDef> content;
+    ASSERT_EQ(AAFRESULT_SUCCESS, object->GetDefinition(definition.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              definition->LookupPropertyDef(ncfGuid("06010104-0201-0000-060E-2B3401010102"),
+                                            content.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, object->RemoveOptionalProperty(content));
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_FOUND, header_->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_FOUND, header_->AddMob(FileMob(1)));
+    EXPECT_LT(file_->Save(), 0);
+    Ptr<IAAFFile> other;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, other.Out()));
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_FOUND, file_->SaveCopyAs(other));
+}
+
 TEST_F(Header, SharesItsContentWithTheContentStorage) {
     Ptr<IAAFContentStorage> storage;
     ASSERT_EQ(AAFRESULT_SUCCESS, header_->GetContentStorage(storage.Out()));
