@@ -11,6 +11,8 @@
 #include <optional>
 #include <set>
 
+#include "reference_host/header_parser/QTParser.h"
+
 namespace cliphost {
 namespace {
 
@@ -108,8 +110,18 @@ std::string DiagnoseMovie(const std::filesystem::path& movie) {
                          "copy it again",
                          top.cutAtom);
     }
-    return "the movie header is there but can't be used: no video or sound track with a known "
-           "layout, a length of 0, or tables that do not fit the file; -v shows more";
+    // The header is there: the parser's own reason tells what it found.
+    const auto parser = host::MakeRef<header_parser::QTParser>();
+    const auto readAt = [&stream](ncfUInt64 position, ncfUInt8* to, ncfUInt32 wanted) {
+        stream.clear();
+        stream.seekg(static_cast<std::streamoff>(position));
+        stream.read(reinterpret_cast<char*>(to), wanted);
+        return static_cast<ncfUInt32>(stream.gcount());
+    };
+    if (header_parser::ReadHeaders(*parser, readAt) < 0) {
+        return fmt::format("the movie header can't be used: {}", parser->Refusal().reason);
+    }
+    return "the movie header can be read, but holds no picture or sound of a length above 0";
 }
 
 }  // namespace cliphost
