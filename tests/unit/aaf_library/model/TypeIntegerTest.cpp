@@ -83,6 +83,20 @@ TEST_F(IntegerTypes, RenamesReadAsTheirBase) {
     EXPECT_EQ(rename->CreateValue(nullptr, &out), AAFRESULT_NULL_PARAM);
 }
 
+TEST_F(IntegerTypes, BuiltInOnesHaveTheirSign) {
+    const std::pair<aafUID_t, aafBoolean_t> expected[] = {
+        {kAAFTypeID_Int8, kAAFTrue},    {kAAFTypeID_Int16, kAAFTrue},
+        {kAAFTypeID_Int32, kAAFTrue},   {kAAFTypeID_Int64, kAAFTrue},
+        {kAAFTypeID_UInt8, kAAFFalse},  {kAAFTypeID_UInt16, kAAFFalse},
+        {kAAFTypeID_UInt32, kAAFFalse}, {kAAFTypeID_UInt64, kAAFFalse},
+    };
+    for (const auto& entry : expected) {
+        aafBoolean_t isSigned = -1;
+        EXPECT_EQ(TypeAs<IAAFTypeDefInt>(entry.first)->IsSigned(&isSigned), AAFRESULT_SUCCESS);
+        EXPECT_EQ(isSigned, entry.second);
+    }
+}
+
 TEST_F(IntegerTypes, InitializeWorksOnce) {
     const auto type = NewMeta<IAAFTypeDefInt>(AUID_AAFTypeDefInt);
     aafUInt32 size = 0;
