@@ -320,6 +320,20 @@ TEST_F(VideoDescriptorTest, ASecondDescriptorIsLikeTheFirst) {
     EXPECT_TRUE(aaf.has("MultipleDescriptor1.AppendFileDescriptor CDCIDescriptor2"));
 }
 
+TEST_F(VideoDescriptorTest, ARecordReadByHalfLeavesItsTracesOnTheProviderRoad) {
+    clip->halfReadRecord = true;
+    clip->record.pictureEssenceCoding = ncfGuid("04010202-0306-0100-060E-2B340401010D");
+    clip->record.sampledWidth = 33;
+    clip->record.displayYOffset = 2;
+    clip->record.swapAspectRatio = true;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetCompression 04010202-0306-0100-060E-2B340401010D"));
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetSampledView 1080 33 0 0"));
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetDisplayView 1080 1920 0 2"));
+    // Only the exchange of the aspect is undone.
+    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetImageAspectRatio 16/9"));
+}
+
 TEST_F(VideoDescriptorTest, AnEmptyLineMapIsTheLibrarysToRefuse) {
     clip->nativePicture = 1;
     clip->record.displayHeight = clip->record.displayWidth = 10;

@@ -45,6 +45,7 @@ public:
     // 1: the host reads the file, by `record`; 0: the sample provider serves.
     NCFRESULT nativePicture = 0;
     AAFInfo record;
+    bool halfReadRecord = false;  // fills the record although the answer is 0
     bool askRetriever = false;    // takes answer and record from the data files
     ncfUInt32 code = 0x61766331;  // 'avc1'
     ncfUInt32 vendor = 0;
@@ -132,7 +133,7 @@ public:
             return QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
                        this, out, &id) == NCF_OK;
         }
-        if (nativePicture == 1) {
+        if (nativePicture == 1 || halfReadRecord) {
             *out = record;
         }
         return nativePicture;
