@@ -62,6 +62,22 @@ bool ReadLinearKind(AVCodecID codec, SoundForm& form) {
     return form.bitsPerChannel > 0;
 }
 
+// Bytes of a packet of all channels, where all packets have one size; 0 for the
+// rest. The movie reader leaves it out for the kinds that QuickTime itself has.
+ncfUInt32 ConstantPacketSize(const AVCodecParameters& parameters) {
+    constexpr ncfUInt32 kIma4Packet = 34;  // 64 samples of a channel
+    const auto channels = static_cast<ncfUInt32>(parameters.ch_layout.nb_channels);
+    switch (parameters.codec_id) {
+        case AV_CODEC_ID_PCM_ALAW:
+        case AV_CODEC_ID_PCM_MULAW: return channels;
+        case AV_CODEC_ID_ADPCM_IMA_QT: return kIma4Packet * channels;
+        default: break;
+    }
+    const bool constant = av_get_bits_per_sample(parameters.codec_id) > 0;
+    return constant && parameters.block_align > 0 ? static_cast<ncfUInt32>(parameters.block_align)
+                                                  : 0;
+}
+
 ncfUInt32 FormatIdOf(const AVCodecParameters& parameters) {
     for (const CompressedRow& row : kCompressed) {
         if (row.codec == parameters.codec_id) {
@@ -91,12 +107,7 @@ bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
         form.isConstantBitRate = true;
     } else {
         form.formatId = FormatIdOf(parameters);
-        // Only kinds whose packets all have one size tell a size here.
-        const bool constant = av_get_bits_per_sample(parameters.codec_id) > 0;
-        form.bytesPerPacket =
-            constant
-                ? static_cast<ncfUInt32>(parameters.block_align > 0 ? parameters.block_align : 0)
-                : 0;
+        form.bytesPerPacket = ConstantPacketSize(parameters);
         form.framesPerPacket =
             parameters.frame_size > 0 ? static_cast<ncfUInt32>(parameters.frame_size) : 0;
     }
