@@ -171,10 +171,10 @@ NCFRESULT QuickTimeClip::GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFStrin
 
 NCFRESULT QuickTimeClip::GetTrackCount(ncfUInt32* trackCount) {
     NCF_FUNCTION("QuickTimeClip::GetTrackCount");
-    CHK_PTR(trackCount);
     if (tracks_.empty()) {
         return NCF_E_NOTFOUND;
     }
+    CHK_PTR(trackCount);
     *trackCount = static_cast<ncfUInt32>(tracks_.size());
     return NCF_OK;
 }

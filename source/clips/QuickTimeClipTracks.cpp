@@ -57,6 +57,7 @@ NCFRESULT QuickTimeClip::GetTrackInfo(ncfUInt32 qtTrack, ITrackInfo** trackInfo)
 NCFRESULT QuickTimeClip::GetAudioTrack(ncfUInt32 qtTrack, IAudioTrackInfo** audioTrackInfo) {
     NCF_FUNCTION("QuickTimeClip::GetAudioTrack");
     CHK_INARG(audioTrackInfo);
+    *audioTrackInfo = nullptr;
     NCFSmartPtr<ITrackInfo> trackInfo;
     NCF_RETURN(GetTrackInfo(qtTrack, trackInfo.outArg()));
     void* found = nullptr;
@@ -69,6 +70,7 @@ NCFRESULT QuickTimeClip::GetAudioTrack(ncfUInt32 qtTrack, IAudioTrackInfo** audi
 NCFRESULT QuickTimeClip::GetVideoTrack(ncfUInt32 qtTrack, IVideoTrackInfo** videoTrackInfo) {
     NCF_FUNCTION("QuickTimeClip::GetVideoTrack");
     CHK_INARG(videoTrackInfo);
+    *videoTrackInfo = nullptr;
     NCFSmartPtr<ITrackInfo> trackInfo;
     NCF_RETURN(GetTrackInfo(qtTrack, trackInfo.outArg()));
     void* found = nullptr;

@@ -108,6 +108,7 @@ TEST_F(QuickTimeClipTracks, HasNoTracksWhenTheLoadFailed) {
     ncfUInt32 count = 5;
     EXPECT_EQ(clip->GetTrackCount(&count), NCF_E_NOTFOUND);
     EXPECT_EQ(count, 5u);
+    EXPECT_EQ(clip->GetTrackCount(nullptr), NCF_E_NOTFOUND) << "tracks come before the output";
 }
 
 TEST_F(QuickTimeClipTracks, HandsTheParsersCountFailureOnUnlogged) {
@@ -143,6 +144,22 @@ TEST_F(QuickTimeClipTracks, HandsOutTracksByTheirKind) {
     EXPECT_EQ(clip->GetTrackInfo(4, nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(clip->GetAudioTrack(8, nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(clip->GetVideoTrack(3, nullptr), NCF_E_INVALIDARG);
+}
+
+TEST_F(QuickTimeClipTracks, NullsTheTrackThatItDoesNotHandOut) {
+    LoadMany();
+    ITrackInfo* any = parser->otherTracks[0];
+    IAudioTrackInfo* audio = parser->audioTracks[0];
+    IVideoTrackInfo* video = parser->videoTracks[0];
+    IQTSampleTable* table = parser->otherTracks[0]->table;
+    EXPECT_EQ(clip->GetTrackInfo(99, &any), NCF_E_NOTFOUND);
+    EXPECT_EQ(clip->GetAudioTrack(99, &audio), NCF_E_NOTFOUND);
+    EXPECT_EQ(clip->GetVideoTrack(99, &video), NCF_E_NOTFOUND);
+    EXPECT_EQ(clip->GetSampleTable(99, &table), NCF_E_NOTFOUND);
+    EXPECT_EQ(any, nullptr);
+    EXPECT_EQ(audio, nullptr);
+    EXPECT_EQ(video, nullptr);
+    EXPECT_EQ(table, nullptr);
 }
 
 TEST_F(QuickTimeClipTracks, KeepsTheFirstTracksOnceAsked) {
