@@ -7,6 +7,66 @@
 
 namespace {
 
+// A string over one of the host's, which refuses one operation.
+class StubbornString : public FakeObject<INCFString> {
+public:
+    explicit StubbornString(const std::string& text) : text_(HostText(text)) {}
+
+    NCFRESULT toUtf32 = NCF_OK;
+    NCFRESULT back = NCF_OK;
+    NCFRESULT raw = NCF_OK;
+    NCFRESULT search = NCF_OK;
+    ncfSInt32 wrongPlace = -1;  // what the search says instead
+    std::string Text() const { return TextOf(text_.inArg()); }
+
+    ncfUInt32 GetEncoding() override { return text_->GetEncoding(); }
+    ncfUInt32 GetLength() override { return text_->GetLength(); }
+    ncfBool IsEmpty() override { return text_->IsEmpty(); }
+    NCFRESULT Assign(INCFString*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT AssignUTF8(ncfUInt32, const ncfUTF8*, ncfUInt32) override { return NCF_E_NOTIMPL; }
+    NCFRESULT AssignUTF16(ncfUInt32, const ncfUTF16*, ncfUInt32) override { return NCF_E_NOTIMPL; }
+    NCFRESULT AssignWCHAR(ncfUInt32, const ncfWCHAR*, ncfUInt32) override { return NCF_E_NOTIMPL; }
+    NCFRESULT ConvertTo(ncfUInt32 encoding) override {
+        const NCFRESULT result = encoding == kNCFUTF32 ? toUtf32 : back;
+        return result < 0 ? result : text_->ConvertTo(encoding);
+    }
+    NCFRESULT ConvertCopy(ncfUInt32, INCFString**) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetRawUTF8(ncfUTF8**) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetRawUTF16(ncfUTF16**) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetRawUTF32(ncfUTF32** out) override {
+        return raw < 0 ? raw : text_->GetRawUTF32(out);
+    }
+    NCFRESULT GetRawWCHAR(ncfWCHAR**) override { return NCF_E_NOTIMPL; }
+    NCFRESULT FindCharacter(ncfUTF32 character, ncfSInt32 from, ncfBool forward,
+                            ncfSInt32* at) override {
+        if (search < 0) {
+            *at = 0;  // not to be believed
+            return search;
+        }
+        if (wrongPlace >= 0) {
+            *at = wrongPlace;
+            return NCF_OK;
+        }
+        return text_->FindCharacter(character, from, forward, at);
+    }
+    NCFRESULT FindWCHAR(const ncfWCHAR*, ncfUInt32, ncfUInt32, ncfSInt32*) override {
+        return NCF_E_NOTIMPL;
+    }
+
+private:
+    NCFSmartPtr<INCFString> text_;
+};
+
+class SlashesOfAStubbornString : public ClipTest {
+protected:
+    SlashesOfAStubbornString() { path.attach(string = new StubbornString("/a/b.mov")); }
+    NCFRESULT Convert() { return ConvertSlashesInPlace(path); }
+
+    StubbornString* string;
+    NCFSmartPtr<INCFString> path;
+    ~SlashesOfAStubbornString() override { path = nullptr; }
+};
+
 class LoadMediaTest : public ClipTest {
 protected:
     NCFRESULT Ask(const std::string& path) {
@@ -168,4 +228,51 @@ TEST(ConvertSlashesInPlace, LeavesAPathWithoutSlashes) {
         EXPECT_EQ(ConvertSlashesInPlace(path), NCF_OK);
         EXPECT_EQ(TextOf(path.inArg()), text);
     }
+}
+
+TEST_F(SlashesOfAStubbornString, StaysWhenTheStringCannotBeConverted) {
+    string->toUtf32 = NCF_E_FAIL;
+    EXPECT_EQ(Convert(), NCF_E_FAIL);
+    EXPECT_EQ(string->Text(), "/a/b.mov");
+    EXPECT_EQ(log->count(ReturnRecord("80000008", "filePath->ConvertTo(kNCFUTF32)",
+                                      "ConvertSlashesInPlace")),
+              1);
+}
+
+TEST_F(SlashesOfAStubbornString, StaysWhenTheBufferIsRefused) {
+    string->raw = NCF_E_ABORT;
+    EXPECT_EQ(Convert(), NCF_E_ABORT);
+    EXPECT_EQ(string->Text(), "/a/b.mov");
+    EXPECT_EQ(log->count(ReturnRecord("80000007", "filePath->GetRawUTF32(&rawUTF32Path)",
+                                      "ConvertSlashesInPlace")),
+              1);
+}
+
+TEST_F(SlashesOfAStubbornString, EndsTheSearchQuietlyWhenItFails) {
+    const ncfUInt32 encoding = string->GetEncoding();
+    string->search = NCF_E_FAIL;
+    EXPECT_EQ(Convert(), NCF_OK);
+    EXPECT_EQ(string->Text(), "/a/b.mov");
+    EXPECT_EQ(string->GetEncoding(), encoding);
+    EXPECT_TRUE(log->records().empty());
+}
+
+TEST_F(SlashesOfAStubbornString, TouchesNothingButSlashes) {
+    string->wrongPlace = 1;
+    EXPECT_EQ(Convert(), NCF_E_FAIL);
+    EXPECT_EQ(string->Text(), "/a/b.mov");
+    EXPECT_EQ(log->count("NCFASSERT( rawUTF32Path[slashPos] == rightSlash )ConvertSlashesInPlace"),
+              1);
+    // A search that never gets on ends too.
+    string->wrongPlace = 0;
+    EXPECT_EQ(Convert(), NCF_E_FAIL);
+    EXPECT_EQ(string->Text(), "\\a/b.mov");
+}
+
+TEST_F(SlashesOfAStubbornString, FailsWhenTheEncodingCannotBeRestored) {
+    string->back = NCF_E_OUTOFMEMORY;
+    EXPECT_EQ(Convert(), NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(log->count(ReturnRecord("80000002", "filePath->ConvertTo(srcType)",
+                                      "ConvertSlashesInPlace")),
+              1);
 }

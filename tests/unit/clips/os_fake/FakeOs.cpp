@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cstdlib>
 #include <cstring>
+#include <new>
 
 #include "source/plugin/os/Os.h"
 
@@ -30,6 +31,9 @@ FileHandle OpenForReading(const std::u16string& path) {
     FakeOs& system = FakeOs::Get();
     ++system.opens;
     system.openedPath = path;
+    if (system.openThrows) {
+        throw std::bad_alloc();
+    }
     return system.openFails ? kNoFile : kTheFile;
 }
 

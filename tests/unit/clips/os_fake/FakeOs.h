@@ -16,6 +16,7 @@ struct FakeOs {
     std::vector<ncfUInt8> content;
     ncfUInt32 sectorSize = 2048;  // 0: the volume doesn't tell
     bool openFails = false;
+    bool openThrows = false;  // something that is no result
     bool closeFails = false;
     bool sizeFails = false;
     bool positionFails = false;
