@@ -62,6 +62,41 @@ TEST_F(OperatingSystem, ReadsAFileWhosePathHasBackslashes) {
     EXPECT_TRUE(os::Close(file));
 }
 
+TEST_F(OperatingSystem, StepsDownToBufferedReadsWhereUnbufferedOnesAreRefused) {
+    std::string bytes(5000, '\0');
+    for (std::size_t i = 0; i < bytes.size(); ++i) {
+        bytes[i] = static_cast<char>(i % 251);
+    }
+    const os::FileHandle file = os::OpenForReading(write("a.bin", bytes));
+    ASSERT_NE(file, os::kNoFile);
+    // No unbuffered read starts at such a place, has such a size, or lands
+    // there.
+    std::string seen(1001, 'x');
+    ncfUInt32 bytesRead = 0;
+    ASSERT_TRUE(os::SetPosition(file, 7));
+    ASSERT_TRUE(os::Read(file, &seen[1], 1000, &bytesRead));
+    EXPECT_EQ(bytesRead, 1000u);
+    EXPECT_EQ(seen.substr(1), bytes.substr(7, 1000));
+    ASSERT_TRUE(os::SetPosition(file, 4990));
+    ASSERT_TRUE(os::Read(file, &seen[1], 1000, &bytesRead)) << "and it stays so";
+    EXPECT_EQ(bytesRead, 10u);
+    EXPECT_TRUE(os::Close(file));
+}
+
+TEST_F(OperatingSystem, FailsOnAHandleThatIsNotOpen) {
+    const os::FileHandle file = os::OpenForReading(write("a.bin", "x"));
+    ASSERT_TRUE(os::Close(file));
+    ncfUInt64 size = 7;
+    ncfUInt32 number = 7;
+    char byte = 'x';
+    EXPECT_FALSE(os::GetFileSize(file, &size));
+    EXPECT_EQ(os::LastError(), static_cast<ncfUInt32>(EBADF));
+    EXPECT_FALSE(os::GetSectorSize(file, u"", &number));
+    EXPECT_FALSE(os::SetPosition(file, 0));
+    EXPECT_FALSE(os::Read(file, &byte, 1, &number));
+    EXPECT_EQ(number, 7u);
+}
+
 TEST_F(OperatingSystem, RefusesFoldersPipesAndWhatIsAbsent) {
     std::filesystem::create_directory(folder / "x.mov");
     EXPECT_EQ(os::OpenForReading(pathOf("x.mov")), os::kNoFile);
