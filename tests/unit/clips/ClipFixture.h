@@ -3,6 +3,7 @@
 #pragma once
 
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 #include <algorithm>
 #include <fstream>
@@ -34,12 +35,13 @@ public:
     const std::string& path() const { return path_; }
 
 private:
-    // Tests run side by side, each in a process of its own.
+    // Tests run side by side, each in a process of its own, and so may two
+    // builds of the same tests.
     static std::string UniquePrefix() {
         static int count = 0;
         const auto* const test = testing::UnitTest::GetInstance()->current_test_info();
         std::string prefix = std::string(test->test_suite_name()) + "_" + test->name() + "_" +
-                             std::to_string(++count) + "_";
+                             std::to_string(getpid()) + "_" + std::to_string(++count) + "_";
         std::replace(prefix.begin(), prefix.end(), '/', '_');
         return prefix;
     }

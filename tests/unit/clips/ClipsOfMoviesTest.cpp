@@ -76,8 +76,9 @@ protected:
     }
 
     const std::int64_t objectsBefore = host::LiveObjectCount();
-    const std::string path = testing::TempDir() + "clip_of_movie_" +
-                             testing::UnitTest::GetInstance()->current_test_info()->name() + ".mov";
+    const std::string path = testing::TempDir() + "clip_of_movie_" + std::to_string(getpid()) +
+                             "_" + testing::UnitTest::GetInstance()->current_test_info()->name() +
+                             ".mov";
     std::unique_ptr<FakeHost> host;
     Movie movie;
     Track video;

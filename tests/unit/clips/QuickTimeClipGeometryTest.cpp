@@ -70,6 +70,9 @@ TEST_F(QuickTimeClipGeometry, TellsStandardRastersByTheirAreaWithin15PerCent) {
     // From 487 lines on the area is that of 720 x 576.
     ExpectSize(SourceOf(720, 487, 4, 3), {600, 1}, {450, 1});   // 0.845
     ExpectSize(SourceOf(720, 490, 4, 3), {1200, 1}, {900, 1});  // 0.851
+    // Upwards too.
+    ExpectSize(SourceOf(768, 576, 4, 3), {1200, 1}, {900, 1});  // 1.067
+    ExpectSize(SourceOf(800, 600, 4, 3), {4000, 6}, {500, 1});  // 1.157
 }
 
 TEST_F(QuickTimeClipGeometry, KeepsFractionsThatDoNotDivide) {
@@ -103,10 +106,11 @@ TEST_F(QuickTimeClipGeometry, RoundsTheMatrixToTellRotation) {
         float b;
         bool rotated;
     } const kMatrices[] = {
-        {0.4f, 0.6f, true},   {0.0f, 1.0f, true},   {-1.4f, 1.4f, true},  // cutting towards zero
-        {0.5f, 1.0f, false},  {0.0f, 0.4f, false},  {0.0f, 1.5f, false},
-        {0.0f, -1.0f, false},  // the other way round
-        {1.0f, 0.0f, false},  {1e30f, 1.0f, false},
+        {0.4f, 0.6f, true},  {0.0f, 0.5f, true},
+        {0.0f, 1.0f, true},  {-1.4f, 1.4f, true},  // cutting towards zero
+        {0.5f, 1.0f, false}, {0.0f, 0.4f, false},
+        {0.0f, 1.5f, false}, {0.0f, -1.0f, false},  // the other way round
+        {1.0f, 0.0f, false}, {1e30f, 1.0f, false},
     };
     for (const auto& matrix : kMatrices) {
         Video().matrix[0] = matrix.a;

@@ -120,6 +120,16 @@ TEST_F(QuickTimeClipOfShortFile, ShowsTheParserZerosBehindTheEnd) {
     EXPECT_EQ(parser->fed[0].bytes, expected);
 }
 
+TEST_F(QuickTimeClipLoading, ShowsZerosBehindTheEndAlsoInAUsedBuffer) {
+    parser->script = {{QT_E_MOREDATA, 8900, 4096}, {NCF_OK, 0, 0}};
+    LoadVideo();
+    const auto whole = CountingBytes(9000);
+    std::vector<ncfUInt8> expected(whole.begin() + 8900, whole.end());
+    expected.resize(4096);
+    ASSERT_EQ(parser->fed.size(), 2u);
+    EXPECT_EQ(parser->fed[1].bytes, expected);
+}
+
 TEST_F(QuickTimeClipOfLargeFile, GrowsTheBufferAndKeepsItForSmallerReads) {
     parser->script = {{QT_E_MOREDATA, 5, 1000000}, {QT_E_MOREDATA, 1000001, 100}, {NCF_OK, 0, 0}};
     LoadVideo();
@@ -266,6 +276,16 @@ TEST_F(QuickTimeClipLoading, LosesASecondTrackWithAUsedId) {
     EXPECT_EQ(count, 1u);
     ncfUInt32 type = 99;
     EXPECT_EQ(clip->GetTrackType(7, &type), NCF_OK);
+    EXPECT_EQ(type, ncfUInt32{kTrackVideo});
+}
+
+TEST_F(QuickTimeClipLoading, TakesATrackWhoseIdCannotBeRead) {
+    parser->AddVideoTrack(7);
+    Video().results["GetTrackId"] = NCF_E_FAIL;
+    Load();
+    EXPECT_TRUE(clip->IsLoaded());
+    ncfUInt32 type = 99;
+    EXPECT_EQ(clip->GetTrackType(0, &type), NCF_OK) << "it stands under the id 0";
     EXPECT_EQ(type, ncfUInt32{kTrackVideo});
 }
 
