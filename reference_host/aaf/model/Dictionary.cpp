@@ -7,6 +7,7 @@
 #include "reference_host/aaf/model/ClassDefinition.h"
 #include "reference_host/aaf/model/Enumerator.h"
 #include "reference_host/aaf/model/Model.h"
+#include "reference_host/aaf/model/Text.h"
 #include "reference_host/aaf/model/StoredNumbers.h"
 #include "reference_host/aaf/model/TypeDefinition.h"
 
@@ -41,13 +42,91 @@ const PropertyKey* SetFor(const GUID& classId) {
     return nullptr;
 }
 
+// The sets that a new dictionary offers something in.
+struct Offer {
+    const GUID& classId;
+    const PropertyKey& set;
+    Span<BuiltInDefinition> (*entries)();
+};
+
+const Offer kOffers[] = {
+    {AUID_AAFDataDefinition, prop::Dictionary_DataDefinitions, BuiltInDataDefinitions},
+    {AUID_AAFContainerDefinition, prop::Dictionary_ContainerDefinitions,
+     BuiltInContainerDefinitions},
+};
+
+// Sets a flag for the length of a scope.
+class Raised {
+public:
+    explicit Raised(bool& flag) : flag_(flag), before_(flag) { flag_ = true; }
+    ~Raised() { flag_ = before_; }
+    Raised(const Raised&) = delete;
+    Raised& operator=(const Raised&) = delete;
+
+private:
+    bool& flag_;
+    bool before_;
+};
+
 }  // namespace
 
 Object* Dictionary::FindDefinition(const GUID& classId, const GUID& id) const {
     const PropertyKey* set = SetFor(classId);
+    return set == nullptr ? nullptr : Find(*set, id);
+}
+
+Object* Dictionary::FindMade(const PropertyKey& set, const GUID& id) const {
     Bytes key;
     AppendGuid(id, key);
-    return set == nullptr ? nullptr : FindInSet(*set, key.data(), key.size());
+    return FindInSet(set, key.data(), key.size());
+}
+
+Object* Dictionary::Find(const PropertyKey& set, const GUID& id) const {
+    const Raised making(isMaking_);
+    Object* const made = FindMade(set, id);
+    if (made != nullptr || !hasOffers_) {
+        return made;
+    }
+    for (const Offer& offer : kOffers) {
+        if (!(offer.set.id == set.id)) {
+            continue;
+        }
+        for (const BuiltInDefinition& entry : offer.entries()) {
+            if (entry.id == id) {
+                Make(set, entry);
+                return FindMade(set, id);
+            }
+        }
+    }
+    return nullptr;
+}
+
+void Dictionary::Make(const PropertyKey& set, const BuiltInDefinition& entry) const {
+    const auto enter = [&](auto definition) {
+        definition->Initialize(entry.id, Widen(entry.name).c_str(),
+                               Widen(entry.description).c_str());
+        const_cast<Dictionary*>(this)->AddToSet(set, definition->Identity());
+    };
+    if (set.id == prop::Dictionary_DataDefinitions.id) {
+        enter(model()->NewObject<DataDefinition>(AUID_AAFDataDefinition));
+    } else {
+        enter(model()->NewObject<ContainerDefinition>(AUID_AAFContainerDefinition));
+    }
+}
+
+void Dictionary::Complete() const {
+    if (!hasOffers_ || isMaking_) {
+        return;
+    }
+    const Raised making(isMaking_);
+    hasOffers_ = false;
+    for (const Offer& offer : kOffers) {
+        for (const BuiltInDefinition& entry : offer.entries()) {
+            if (FindMade(offer.set, entry.id) == nullptr) {
+                Make(offer.set, entry);
+            }
+        }
+    }
 }
 
 HRESULT Dictionary::AddDefinition(const GUID& classId, Object* definition) {
@@ -55,6 +134,7 @@ HRESULT Dictionary::AddDefinition(const GUID& classId, Object* definition) {
     if (set == nullptr || definition == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }
+    const Raised making(isMaking_);
     return AddToSet(*set, definition->Identity());
 }
 
@@ -75,7 +155,8 @@ HRESULT Dictionary::Register(Interface* argument, const PropertyKey& set) {
         return AAFRESULT_NOT_INITIALIZED;
     }
     // The first definition with an id stays the one that is found.
-    if (FindInSet(set, key.data(), key.size()) != nullptr) {
+    const Raised making(isMaking_);
+    if (Find(set, GuidAt(key.data())) != nullptr) {
         return AAFRESULT_SUCCESS;
     }
     return AddToSet(set, definition->Identity());
@@ -86,9 +167,7 @@ HRESULT Dictionary::Lookup(const GUID& id, const PropertyKey& set, Interface** o
     if (out == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    Bytes key;
-    AppendGuid(id, key);
-    Object* found = FindInSet(set, key.data(), key.size());
+    Object* found = Find(set, id);
     return found == nullptr ? AAFRESULT_NO_MORE_OBJECTS : GiveOut(found, out);
 }
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "reference_host/aaf/model/BuiltIn.h"
 #include "reference_host/aaf/model/DefinitionObjects.h"
 
 namespace aaf {
@@ -14,6 +15,10 @@ public:
     Object* FindDefinition(const GUID& classId, const GUID& id) const;
     // Adds one of that class; its id must be new.
     HRESULT AddDefinition(const GUID& classId, Object* definition);
+
+    // From now on the built-in data and container definitions are there; each comes into being
+    // when it is looked up, all of them when the whole set is looked at.
+    void OfferBuiltIn() { hasOffers_ = true; }
 
     bool BelongsToModel() const override { return true; }
 
@@ -84,11 +89,22 @@ public:
     HRESULT LookupSoundDataDef(IAAFDataDef** dataDef) override;
     HRESULT LookupTimecodeDataDef(IAAFDataDef** dataDef) override;
 
+protected:
+    void Complete() const override;
+
 private:
+    // The element of a set with that id; a built-in one is made if it is not there yet.
+    Object* Find(const PropertyKey& set, const GUID& id) const;
+    Object* FindMade(const PropertyKey& set, const GUID& id) const;
+    void Make(const PropertyKey& set, const BuiltInDefinition& entry) const;
+
     template <class Interface>
     HRESULT Register(Interface* definition, const PropertyKey& set);
     template <class Interface>
     HRESULT Lookup(const GUID& id, const PropertyKey& set, Interface** out) const;
+
+    mutable bool hasOffers_ = false;  // built-in definitions may be missing
+    mutable bool isMaking_ = false;   // one element is wanted, not the whole set
 };
 
 }  // namespace aaf

@@ -46,19 +46,9 @@ const GUID* const kMadeWithTheFile[] = {&AUID_AAFHeader, &AUID_AAFDictionary,
 
 RefPtr<Model> Model::Create(const ClassRegistry& classes) {
     RefPtr<Model> model(new Model(classes));
-    for (const BuiltInClass& entry : BuiltInClasses()) {
-        if (entry.listedAtStart) {
-            model->FindClass(entry.id);
-        }
-    }
-    for (const BuiltInType& entry : BuiltInTypes()) {
-        if (entry.listedAtStart) {
-            model->FindType(entry.id);
-        }
-    }
     model->dictionary_ = model->NewObject<Dictionary>(AUID_AAFDictionary);
     model->dictionary_->Keep();
-    model->FillDictionary();
+    model->dictionary_->OfferBuiltIn();
     return model;
 }
 
@@ -89,19 +79,45 @@ void Model::Release() {
     }
 }
 
-void Model::FillDictionary() {
-    for (const BuiltInDefinition& entry : BuiltInDataDefinitions()) {
-        const auto definition = NewObject<DataDefinition>(AUID_AAFDataDefinition);
-        definition->Initialize(entry.id, Widen(entry.name).c_str(),
-                               Widen(entry.description).c_str());
-        dictionary_->AddToSet(prop::Dictionary_DataDefinitions, definition->Identity());
+// A new file lists some of the built-in definitions. They are made when the lists are first looked
+// at: most files are described without.
+void Model::ListStart() {
+    if (hasListedStart_) {
+        return;
     }
-    for (const BuiltInDefinition& entry : BuiltInContainerDefinitions()) {
-        const auto definition = NewObject<ContainerDefinition>(AUID_AAFContainerDefinition);
-        definition->Initialize(entry.id, Widen(entry.name).c_str(),
-                               Widen(entry.description).c_str());
-        dictionary_->AddToSet(prop::Dictionary_ContainerDefinitions, definition->Identity());
+    hasListedStart_ = true;
+    std::unordered_map<GUID, std::size_t, GuidHash> places;
+    for (const BuiltInClass& entry : BuiltInClasses()) {
+        if (entry.listedAtStart) {
+            FindClass(entry.id);
+            places.emplace(entry.id, places.size());
+        }
     }
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        if (entry.listedAtStart) {
+            FindType(entry.id);
+            places.emplace(entry.id, places.size());
+        }
+    }
+    const auto isBefore = [&places](const auto& left, const auto& right) {
+        const auto placeOf = [&places](const auto& definition) {
+            const auto found = places.find(definition->id());
+            return found == places.end() ? places.size() : found->second;
+        };
+        return placeOf(left) < placeOf(right);
+    };
+    std::stable_sort(classes_.begin(), classes_.end(), isBefore);
+    std::stable_sort(types_.begin(), types_.end(), isBefore);
+}
+
+const std::vector<RefPtr<ClassDefinition>>& Model::classes() {
+    ListStart();
+    return classes_;
+}
+
+const std::vector<RefPtr<TypeDefinition>>& Model::types() {
+    ListStart();
+    return types_;
 }
 
 RefPtr<Object> Model::CreateObject(ClassDefinition& definition, bool withDefaults) {

@@ -56,9 +56,10 @@ public:
     // -- Meta-dictionary. Null when unknown.
     ClassDefinition* FindClass(const GUID& id);
     TypeDefinition* FindType(const GUID& id);
-    // The definitions listed so far, in the order in which they came into being.
-    const std::vector<RefPtr<ClassDefinition>>& classes() const { return classes_; }
-    const std::vector<RefPtr<TypeDefinition>>& types() const { return types_; }
+    // The definitions listed so far: those that a new file lists, then the others in the order in
+    // which they came into being.
+    const std::vector<RefPtr<ClassDefinition>>& classes();
+    const std::vector<RefPtr<TypeDefinition>>& types();
     // Adds a definition that a caller made; one whose id exists stays outside, silently for types.
     HRESULT RegisterClass(ClassDefinition& definition);
     HRESULT RegisterType(TypeDefinition& type);
@@ -82,7 +83,7 @@ public:
 private:
     explicit Model(const ClassRegistry& classes);
     ~Model();
-    void FillDictionary();
+    void ListStart();
     ClassDefinition* AddBuiltInClass(const BuiltInClass& entry);
     ClassDefinition& Enter(RefPtr<ClassDefinition> definition);
     TypeDefinition& Enter(RefPtr<TypeDefinition> type);
@@ -96,6 +97,7 @@ private:
     const ClassRegistry& registry_;
     std::size_t pins_ = 0;
     bool dying_ = false;
+    bool hasListedStart_ = false;
     std::vector<RefPtr<ClassDefinition>> classes_;
     std::vector<RefPtr<TypeDefinition>> types_;
     std::vector<RefPtr<TypeDefinition>> keptTypes_;

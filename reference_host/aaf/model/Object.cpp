@@ -35,6 +35,7 @@ PropertyId Object::NumberOf(const PropertyKey& key) const {
 }
 
 PropertyValue* Object::FindValue(const PropertyKey& key) const {
+    Complete();
     const auto found = values_.find(NumberOf(key));
     return found == values_.end() ? nullptr : found->second.get();
 }
@@ -129,10 +130,10 @@ HRESULT Object::GetDefinition(IAAFClassDef** classDef) {
 HRESULT Object::GetProperties(IEnumAAFProperties** enumerator) {
     return MakeEnumerator<IAAFProperty>(
         [self = RefPtr<Object>(this)](std::size_t index) -> RefPtr<Unknown> {
-            if (index >= self->values_.size()) {
+            if (index >= self->values().size()) {
                 return nullptr;
             }
-            const auto entry = std::next(self->values_.begin(), static_cast<std::ptrdiff_t>(index));
+            const auto entry = std::next(self->values().begin(), static_cast<std::ptrdiff_t>(index));
             PropertyDefinition* property = self->class_->FindProperty(entry->first);
             return RefPtr<Unknown>(new Property(*self, *property, *entry->second));
         },
@@ -143,7 +144,7 @@ HRESULT Object::CountProperties(aafUInt32* count) {
     if (count == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    *count = static_cast<aafUInt32>(values_.size());
+    *count = static_cast<aafUInt32>(values().size());
     return AAFRESULT_SUCCESS;
 }
 
@@ -155,7 +156,7 @@ HRESULT Object::GetPropertyValue(IAAFPropertyDef* propDef, IAAFPropertyValue** p
     if (property == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
-    const auto found = values_.find(property->pid());
+    const auto found = values().find(property->pid());
     return found == values_.end() ? AAFRESULT_PROP_NOT_PRESENT
                                   : GiveOut(found->second.get(), propVal);
 }
@@ -180,7 +181,7 @@ HRESULT Object::IsPropertyPresent(IAAFPropertyDef* propDef, aafBoolean_t* result
     if (property == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
-    *result = values_.count(property->pid()) > 0 ? kAAFTrue : kAAFFalse;
+    *result = values().count(property->pid()) > 0 ? kAAFTrue : kAAFFalse;
     return AAFRESULT_SUCCESS;
 }
 
@@ -200,7 +201,7 @@ HRESULT Object::CreateOptionalPropertyValue(IAAFPropertyDef* propDef, IAAFProper
     if (property == nullptr || !property->IsOptional()) {
         return AAFRESULT_BAD_PROP;
     }
-    if (values_.count(property->pid()) > 0) {
+    if (values().count(property->pid()) > 0) {
         return AAFRESULT_PROP_ALREADY_PRESENT;
     }
     PropertyValue* value = RequireValue(property->key());

@@ -81,7 +81,10 @@ public:
     virtual bool BelongsToModel() const { return false; }
 
     // -- Values as they stand, ordered by number.
-    const Values& values() const { return values_; }
+    const Values& values() const {
+        Complete();
+        return values_;
+    }
     PropertyValue* FindValue(const PropertyKey& key) const;
     bool IsPresent(const PropertyKey& key) const { return FindValue(key) != nullptr; }
     // Drops a value; absent: AAFRESULT_PROP_NOT_PRESENT.
@@ -198,6 +201,10 @@ public:
 
 protected:
     ~Object() override;
+
+    // Called before values are looked at: an object whose values come into being when they are
+    // wanted makes them here.
+    virtual void Complete() const {}
 
 private:
     friend class PropertyValue;

@@ -1,0 +1,116 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// How long it takes to describe a folder of 1,000 short movies through the
+// module's list, beside opening each with libavformat and finding out about its
+// streams, in one process. Tells the resident memory after each pass: it must
+// not grow.
+
+#include <benchmark/benchmark.h>
+#include <unistd.h>
+
+#include <cstdio>
+#include <filesystem>
+
+#include "benchmarks/support/Ratios.h"
+#include "host_interfaces/media/PluginComponents.h"
+#include "reference_host/cliphost/Describe.h"
+#include "reference_host/cliphost/FolderClips.h"
+#include "tests/support/movies/Movie.h"
+
+extern "C" {
+#include <libavformat/avformat.h>
+#include <libavutil/log.h>
+}
+
+namespace {
+
+constexpr int kMovies = 1000;
+
+// Short movies of one picture and one sound track, gone with the process.
+class MovieFolder {
+public:
+    MovieFolder()
+        : path_(std::filesystem::temp_directory_path() /
+                ("bench-movies-" + std::to_string(getpid()))) {
+        std::filesystem::create_directories(path_);
+        for (int i = 0; i < kMovies; ++i) {
+            movies::Movie movie;
+            movies::VideoFormat format;
+            format.codec = "apcn";
+            movie.tracks.push_back(
+                movies::VideoTrack(format, 48u + static_cast<unsigned>(i) % 100, 25, 1));
+            movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 96000));
+            movies::Build(movie).WriteTo((path_ / (std::to_string(i) + ".mov")).string());
+        }
+    }
+    ~MovieFolder() { std::filesystem::remove_all(path_); }
+    const std::filesystem::path& Path() const { return path_; }
+
+private:
+    std::filesystem::path path_;
+};
+
+const MovieFolder& Folder() {
+    static const MovieFolder folder;
+    return folder;
+}
+
+double ResidentMegabytes() {
+    long total = 0;
+    long resident = 0;
+    if (std::FILE* const file = std::fopen("/proc/self/statm", "r")) {
+        if (std::fscanf(file, "%ld %ld", &total, &resident) != 2) {
+            resident = 0;
+        }
+        std::fclose(file);
+    }
+    return static_cast<double>(resident) * static_cast<double>(sysconf(_SC_PAGESIZE)) / 1e6;
+}
+
+void DescribeFolder(benchmark::State& state) {
+    cliphost::SessionOptions options;
+    options.programFolder =
+        std::filesystem::read_symlink("/proc/self/exe").parent_path().parent_path();
+    cliphost::Session session(options);
+    const auto path = cliphost::PathForModule(Folder().Path());
+    for (auto _ : state) {
+        const cliphost::FolderClips clips(session, path.get());
+        for (const cliphost::FolderClip& clip : clips.clips()) {
+            const auto description =
+                cliphost::DescribeFromList(session, clips.list(), clip.index, clip.path);
+            if (!description.file) {
+                state.SkipWithError(description.problem.c_str());
+                return;
+            }
+        }
+    }
+    state.SetItemsProcessed(static_cast<std::int64_t>(state.iterations()) * kMovies);
+    state.counters["resident_MB"] = ResidentMegabytes();
+}
+
+void OpenAndFindStreams(benchmark::State& state) {
+    av_log_set_level(AV_LOG_QUIET);
+    for (auto _ : state) {
+        for (const auto& entry : std::filesystem::directory_iterator(Folder().Path())) {
+            AVFormatContext* context = nullptr;
+            if (avformat_open_input(&context, entry.path().c_str(), nullptr, nullptr) < 0 ||
+                avformat_find_stream_info(context, nullptr) < 0) {
+                state.SkipWithError("libavformat does not open a movie");
+                return;
+            }
+            avformat_close_input(&context);
+        }
+    }
+    state.SetItemsProcessed(static_cast<std::int64_t>(state.iterations()) * kMovies);
+    state.counters["resident_MB"] = ResidentMegabytes();
+}
+
+BENCHMARK(DescribeFolder)->Unit(benchmark::kMillisecond)->UseRealTime()->Repetitions(5);
+BENCHMARK(OpenAndFindStreams)->Unit(benchmark::kMillisecond)->UseRealTime()->Repetitions(5);
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    return RunWithRatios(argc, argv, {{"DescribeFolder", "OpenAndFindStreams", "at most 0.667"}});
+}
