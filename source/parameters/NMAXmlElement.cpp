@@ -42,6 +42,12 @@ void NMAXmlElement::CopyTo(NMAXmlNode& target) {
     copy.rebuildAttributeIndex();
 }
 
+// Attributes made in memory are gone and deleted ones are back.
+void NMAXmlElement::DiscardNewChildren() {
+    NMAXmlNode::DiscardNewChildren();
+    rebuildAttributeIndex();
+}
+
 NCFRESULT NMAXmlElement::WriteTo(IXmlWriter* writer) {
     if (!writer) {
         ThrowIfFailed(NCF_E_INVALIDARG);

@@ -27,6 +27,7 @@ public:
     void LoadChildren() override;
     void SetChanged() override;
     void CopyTo(NMAXmlNode& target) override;
+    void DiscardNewChildren() override;
     NCFRESULT WriteTo(IXmlWriter* writer) override;
 
     void GetTagName(NMAString& out);

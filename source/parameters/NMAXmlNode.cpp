@@ -163,7 +163,14 @@ void NMAXmlNode::AddChild(NMAXmlNode* node) {
     }
     node->parent_ = this;
     children_.push_back(node);
-    SetChanged();
+    try {
+        SetChanged();
+    } catch (...) {
+        // The node is still the caller's to delete.
+        children_.pop_back();
+        node->parent_ = nullptr;
+        throw;
+    }
 }
 
 NMAXmlNode* NMAXmlNode::GetOrAddChildForHostNode(IXmlNode* hostNode) {

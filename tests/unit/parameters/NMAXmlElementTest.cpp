@@ -197,6 +197,14 @@ TEST_F(XmlElement, RemovesChildrenByName) {
     EXPECT_EQ(Saved(doc).find("<c"), std::string::npos);
 }
 
+TEST_F(XmlElement, RemovingChildrenIsAChangeOnlyWhenThereAreSome) {
+    Element* const root = load("<a x=\"1\"><b/></a>");
+    root->RemoveChildren(S("c"));
+    EXPECT_EQ(root->GetState(), NMAXmlNode::kInStep);
+    root->RemoveChildren(S("b"));
+    EXPECT_EQ(root->GetState(), NMAXmlNode::kChanged);
+}
+
 TEST_F(XmlElement, RemovesChildrenBySelection) {
     Element* const root = load("<a><b x=\"1\"/><b x=\"2\"><id>7</id></b></a>");
     const NMAXmlPair first[] = {{L"x", L"1"}};

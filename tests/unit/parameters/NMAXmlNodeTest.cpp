@@ -110,6 +110,7 @@ TEST_F(XmlNode, RemovesAChildWithoutDeletingIt) {
     const std::unique_ptr<NMAXmlNode> child(root->FindChild(S("b"), 0));
     root->RemoveChild(child.get());
     EXPECT_EQ(root->CountChildren(S("")), 0u);
+    EXPECT_EQ(root->GetState(), NMAXmlNode::kChanged);
     EXPECT_EQ(Thrown([&] { root->RemoveChild(child.get()); }), NCF_OK) << "no child: no failure";
     EXPECT_EQ(Thrown([&] { root->RemoveChild(nullptr); }), NCF_E_INVALIDARG);
 }
@@ -146,6 +147,19 @@ TEST_F(XmlNode, DiscardsWhatWasMadeInMemoryHereAndBelow) {
     EXPECT_EQ(root->GetState(), NMAXmlNode::kInStep);
 }
 
+TEST_F(XmlNode, DiscardingBringsTheAttributesOfTheHostBack) {
+    Element* const root = load("<a x=\"1\" y=\"2\"><b/></a>");
+    root->SetAttribute(S("x"), S("changed"));
+    root->RemoveAttribute(S("y"));
+    root->SetAttribute(S("z"), S("new"));
+    root->DiscardNewChildren();
+    EXPECT_EQ(AttributeOf(root, "x"), "1");
+    EXPECT_EQ(AttributeOf(root, "y"), "2");
+    EXPECT_FALSE(root->HasAttribute(S("z")));
+    root->SetAttribute(S("z"), S("again"));
+    EXPECT_EQ(AttributeOf(root, "z"), "again");
+}
+
 TEST_F(XmlNode, CopiesItselfWithItsChildrenUnderTheTarget) {
     Element* const root = load("<a x=\"1\"><b>t</b></a>");
     root->SetAttribute(S("x"), S("2"));
@@ -159,7 +173,23 @@ TEST_F(XmlNode, CopiesItselfWithItsChildrenUnderTheTarget) {
     Element* const child = copy.FindChild(S("b"), 0);
     EXPECT_EQ(TextOf(child), "tu");
     EXPECT_EQ(child->Parent(), &copy);
+    Element childCopy;
+    child->CopyTo(childCopy);
+    EXPECT_EQ(childCopy.Parent(), &copy) << "the target itself gets the parent of its model";
     EXPECT_NE(child, root->FindChild(S("b"), 0));
+}
+
+TEST_F(XmlNode, CopiesWhatWasMadeInMemory) {
+    doc.CreateRoot(S("made"));
+    Element* const root = doc.GetRoot();
+    root->SetAttribute(S("x"), S("1"));
+    root->AddChildElementWithText(S("b"), S("t"));
+    Element copy;
+    root->CopyTo(copy);
+    EXPECT_EQ(copy.Origin(), NMAXmlNode::kOriginMemory);
+    EXPECT_EQ(TagOf(&copy), "made");
+    EXPECT_EQ(AttributeOf(&copy, "x"), "1");
+    EXPECT_EQ(TextOf(copy.FindChild(S("b"), 0)), "t");
 }
 
 TEST_F(XmlNode, CopyReplacesWhatTheTargetHeld) {
@@ -225,6 +255,38 @@ TEST_F(XmlNode, KeepsTheOrderOfItsVirtualOperations) {
     reinterpret_cast<void (*)(NMAXmlNode*)>(table[5])(node);
     EXPECT_EQ(node->GetState(), NMAXmlNode::kUnread) << "Reset";
     EXPECT_EQ(node->HostNode(), nullptr);
+}
+
+TEST_F(XmlNode, KeepsTheOrderOfItsOperationsOnChildren) {
+    Element* const root = load("<a><b/></a>");
+    NMAXmlNode* const node = root;
+    void** const table = *reinterpret_cast<void***>(node);
+    const auto hostNode = hostChild(root, 0);
+    auto* const added = new Element;
+    reinterpret_cast<void (*)(NMAXmlNode*, NMAXmlNode*)>(table[7])(node, added);
+    EXPECT_EQ(node->Children().size(), 2u) << "AddChild";
+    using FindByHost = NMAXmlNode* (*)(NMAXmlNode*, IXmlNode*);
+    EXPECT_EQ(reinterpret_cast<FindByHost>(table[8])(node, hostNode.inArg()), node->Children()[0])
+        << "GetOrAddChildForHostNode";
+    reinterpret_cast<void (*)(NMAXmlNode*, NMAXmlNode*)>(table[9])(node, added);
+    EXPECT_EQ(node->Children().size(), 1u) << "RemoveChild";
+    delete added;
+    reinterpret_cast<void (*)(NMAXmlNode*, IXmlNode*)>(table[10])(node, hostNode.inArg());
+    EXPECT_EQ(node->Children().size(), 0u) << "RemoveChildForHostNode";
+    node->AddChild(new Element);
+    reinterpret_cast<void (*)(NMAXmlNode*)>(table[12])(node);
+    EXPECT_EQ(node->Children().size(), 0u) << "DiscardNewChildren";
+    using Write = NCFRESULT (*)(NMAXmlNode*, IXmlWriter*);
+    EXPECT_EQ(Thrown([&] { reinterpret_cast<Write>(table[13])(node, nullptr); }), NCF_E_INVALIDARG)
+        << "WriteTo";
+    NMAXmlAttribute attribute(S("name"), S("value"));
+    void** const itsTable = *reinterpret_cast<void***>(static_cast<NMAXmlNode*>(&attribute));
+    using Read = void (*)(NMAXmlNode*, NMAString*);
+    NMAString text;
+    reinterpret_cast<Read>(itsTable[14])(&attribute, &text);
+    EXPECT_STREQ(text.GetUTF8String(), "name");
+    reinterpret_cast<Read>(itsTable[15])(&attribute, &text);
+    EXPECT_STREQ(text.GetUTF8String(), "value");
 }
 
 }  // namespace

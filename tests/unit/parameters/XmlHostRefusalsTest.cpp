@@ -1,0 +1,214 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// What the mirror asks of the host's two components, in which order, and what
+// becomes of their refusals.
+
+#include "tests/unit/parameters/FakeXmlHost.h"
+#include "tests/unit/parameters/XmlTest.h"
+
+namespace {
+
+using NMA::XMLUtils::NMAXmlAttribute;
+using NMA::XMLUtils::NMAXmlNode;
+using NMA::XMLUtils::NMAXmlText;
+
+// <root x="1"><child y="2">text</child></root>
+class XmlHostRefusals : public XmlTest {
+protected:
+    XmlHostRefusals() {
+        host.maker(kCLSID_XmlDocument, [this](const GUID& iid, void** out) {
+            return reader->QueryInterface(iid, out);
+        });
+        host.maker(kCLSID_XmlWriter, [this](const GUID& iid, void** out) {
+            return writer->QueryInterface(iid, out);
+        });
+    }
+    ~XmlHostRefusals() override {
+        doc.reset();
+        EXPECT_EQ(root.references, 0);
+        EXPECT_EQ(child.references, 0);
+        EXPECT_EQ(reader->Release(), 0u);
+        EXPECT_EQ(writer->Release(), 0u);
+    }
+    Element* Load() {
+        doc->LoadFromString(S("text"));
+        return doc->GetRoot();
+    }
+
+    FakeXmlNode root{kXmlElement, "root"};
+    FakeXmlNode& x = root.AddAttribute("x", "1");
+    FakeXmlNode& child = root.AddElement("child");
+    FakeXmlNode& y = child.AddAttribute("y", "2");
+    FakeXmlNode& text = child.AddText("text");
+    FakeXmlDocument* reader = new FakeXmlDocument(&root);
+    FakeXmlWriter* writer = new FakeXmlWriter;
+    std::unique_ptr<Doc> doc = std::make_unique<Doc>(host.factory());
+};
+
+// --- loading ----------------------------------------------------------------------
+
+TEST_F(XmlHostRefusals, EveryRefusedStepOfLoadingIsThrown) {
+    struct {
+        Refusals* refuser;
+        const char* operation;
+    } const kSteps[] = {{reader, "LoadFromText"}, {reader, "GetRootNode"}, {&root, "query node"}};
+    for (const auto& step : kSteps) {
+        step.refuser->results[step.operation] = NCF_E_ABORT;
+        EXPECT_EQ(Thrown([&] { Load(); }), NCF_E_ABORT) << step.operation;
+        EXPECT_EQ(doc->GetRoot(), nullptr);
+        step.refuser->results.clear();
+    }
+    reader->results["Load"] = NCF_E_ACCESSDENIED;
+    EXPECT_EQ(Thrown([&] { doc->LoadFromFile(S("path")); }), NCF_E_ACCESSDENIED);
+}
+
+TEST_F(XmlHostRefusals, ARootThatIsNoElementFails) {
+    for (const XmlNodeType type : {kXmlAttribute, kXmlText, kXmlCDATA, kXmlOther}) {
+        FakeXmlNode other(type, "other");
+        auto* const odd = new FakeXmlDocument(&other);
+        host.maker(kCLSID_XmlDocument,
+                   [odd](const GUID& iid, void** out) { return odd->QueryInterface(iid, out); });
+        Doc document(host.factory());
+        EXPECT_EQ(Thrown([&] { document.LoadFromString(S("text")); }), NCF_E_FAIL);
+        EXPECT_EQ(document.GetRoot(), nullptr);
+        EXPECT_EQ(other.references, 0);
+        odd->Release();
+    }
+}
+
+TEST_F(XmlHostRefusals, ALoadThatFailsKeepsTheRootThatWasThere) {
+    Element* const before = Load();
+    reader->results["LoadFromText"] = NCF_E_FAIL;
+    EXPECT_EQ(Thrown([&] { Load(); }), NCF_E_FAIL);
+    EXPECT_EQ(doc->GetRoot(), before);
+}
+
+// --- reading ----------------------------------------------------------------------
+
+TEST_F(XmlHostRefusals, NothingIsReadBelowTheLevelsThatAreLookedAt) {
+    Element* const element = Load();
+    EXPECT_EQ(root.childQuestions, 0);
+    EXPECT_NE(element->FindChild(S("child"), 0), nullptr);
+    EXPECT_EQ(element->CountChildren(S("")), 1u);
+    EXPECT_EQ(root.childQuestions, 1) << "once";
+    EXPECT_EQ(child.childQuestions, 0);
+    EXPECT_EQ(TextOf(element->FindChild(S("child"), 0)), "text");
+    EXPECT_EQ(child.childQuestions, 1);
+}
+
+TEST_F(XmlHostRefusals, ARefusedReadingIsThrownAndMayBeTriedAgain) {
+    struct {
+        FakeXmlNode* refuser;
+        const char* operation;
+    } const kSteps[] = {{&root, "GetAttributes"}, {&root, "GetItem"}, {&root, "GetChild"}};
+    for (const auto& step : kSteps) {
+        Element* const element = Load();
+        step.refuser->results[step.operation] = NCF_E_ABORT;
+        EXPECT_EQ(Thrown([&] { element->CountChildren(S("")); }), NCF_E_ABORT) << step.operation;
+        step.refuser->results.clear();
+        EXPECT_EQ(element->CountChildren(S("")), 1u) << step.operation;
+        EXPECT_EQ(element->Children().size(), 2u) << "nothing twice";
+        EXPECT_EQ(AttributeOf(element, "x"), "1");
+    }
+}
+
+TEST_F(XmlHostRefusals, RefusedNamesAndValuesAreThrown) {
+    Element* const element = Load();
+    NMAString out;
+    x.results["GetValue"] = NCF_E_ABORT;
+    EXPECT_EQ(Thrown([&] { element->GetAttribute(S("x"), out); }), NCF_E_ABORT);
+    child.results["GetTagName"] = NCF_E_FAIL;
+    EXPECT_EQ(Thrown([&] { element->FindChild(S("child"), 0); }), NCF_E_FAIL);
+    child.results = {{"query element", NCF_E_NOINTERFACE}};
+    EXPECT_EQ(Thrown([&] { element->FindChild(S("child"), 0); }), NCF_E_NOINTERFACE);
+    child.results.clear();
+    Element* const found = element->FindChild(S("child"), 0);
+    text.results["GetValue"] = NCF_E_OUTOFMEMORY;
+    EXPECT_EQ(Thrown([&] { found->GetText(out); }), NCF_E_OUTOFMEMORY);
+    root.results["GetName"] = NCF_E_FAIL;
+    EXPECT_EQ(Thrown([&] { element->GetNodeName(out); }), NCF_E_FAIL);
+}
+
+// --- changing ---------------------------------------------------------------------
+
+TEST_F(XmlHostRefusals, AChildThatCouldNotBeAddedStaysWithTheCaller) {
+    Element* const element = Load();
+    element->LoadChildren();
+    x.results["GetName"] = NCF_E_ABORT;  // the index of attributes can't be made anew
+    Element added;
+    EXPECT_EQ(Thrown([&] { element->AddChild(&added); }), NCF_E_ABORT);
+    EXPECT_EQ(added.Parent(), nullptr);
+    EXPECT_EQ(Thrown([&] { element->AddChildElement(S("new"), nullptr); }), NCF_E_ABORT);
+    EXPECT_EQ(Thrown([&] { element->AddChildElementWithText(S("new"), S("t")); }), NCF_E_ABORT);
+    EXPECT_EQ(Thrown([&] { element->AddText(S("new")); }), NCF_E_ABORT);
+    FakeXmlNode foreign(kXmlElement, "foreign");
+    EXPECT_EQ(Thrown([&] { element->GetOrAddChildForHostNode(&foreign); }), NCF_E_ABORT);
+    EXPECT_EQ(element->Children().size(), 2u) << "what was there";
+    EXPECT_EQ(foreign.references, 0);
+}
+
+TEST_F(XmlHostRefusals, ARefusedIdentityIsThrown) {
+    Element* const element = Load();
+    child.results["query identity"] = NCF_E_ABORT;
+    const std::unique_ptr<NMAXmlNode> twin(NMAXmlNode::Wrap(&child));
+    EXPECT_EQ(Thrown([&] { element->AddChild(twin.get()); }), NCF_E_ABORT);
+    EXPECT_EQ(Thrown([&] { element->RemoveChildForHostNode(&child); }), NCF_E_ABORT);
+    EXPECT_EQ(element->Children().size(), 2u);
+}
+
+TEST_F(XmlHostRefusals, AHostNodeOfAnotherTypeMakesNoChild) {
+    Element* const element = Load();
+    FakeXmlNode comment(kXmlOther, "comment");
+    EXPECT_EQ(element->GetOrAddChildForHostNode(&comment), nullptr);
+    EXPECT_EQ(element->Children().size(), 2u);
+}
+
+// --- writing ----------------------------------------------------------------------
+
+TEST_F(XmlHostRefusals, WritesAttributesBeforeOtherChildrenEachUnderItsParentsName) {
+    Element* const element = Load();
+    element->AddText(S("tail"));
+    element->SetAttribute(S("z"), S("3"));
+    doc->SaveToFile(S("path"));
+    EXPECT_EQ(writer->lines, (std::vector<std::string>{
+                                 "Open path", "Element root -", "Attribute root x 1",
+                                 "Attribute root z 3", "Element child root", "Attribute child y 2",
+                                 "Text text child", "Text tail root", "Close"}));
+}
+
+TEST_F(XmlHostRefusals, SavingToATextOpensWithoutPathAndDoesNotClose) {
+    doc->CreateRoot(S("a"));
+    NMAString saved;
+    doc->SaveToString(saved);
+    EXPECT_STREQ(saved.GetUTF8String(), "the text");
+    EXPECT_EQ(writer->lines, (std::vector<std::string>{"Open -", "Element a -", "GetText"}));
+}
+
+TEST_F(XmlHostRefusals, DeletedNodesAreNotWritten) {
+    Element* const element = Load();
+    element->RemoveAttribute(S("x"));
+    Element* const found = element->FindChild(S("child"), 0);
+    found->LoadChildren();
+    for (NMAXmlNode* const node : found->Children()) {
+        node->MarkDeleted();
+    }
+    doc->SaveToFile(S("path"));
+    EXPECT_EQ(writer->lines, (std::vector<std::string>{"Open path", "Element root -",
+                                                       "Element child root", "Close"}));
+}
+
+TEST_F(XmlHostRefusals, EveryRefusalOfTheWriterIsThrown) {
+    Load();
+    for (const char* const operation : {"Open", "Element", "Attribute", "Text", "Close"}) {
+        writer->results[operation] = NCF_E_ABORT;
+        EXPECT_EQ(Thrown([&] { doc->SaveToFile(S("path")); }), NCF_E_ABORT) << operation;
+        writer->results.clear();
+    }
+    writer->results["GetText"] = NCF_E_ABORT;
+    NMAString saved(S("before"));
+    EXPECT_EQ(Thrown([&] { doc->SaveToString(saved); }), NCF_E_ABORT);
+    EXPECT_STREQ(saved.GetUTF8String(), "before");
+}
+
+}  // namespace
