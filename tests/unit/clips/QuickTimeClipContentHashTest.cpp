@@ -196,6 +196,40 @@ TEST_F(QuickTimeClipContentHash, StopsAtEveryFailure) {
     EXPECT_EQ(Ask(), NCF_OK);
 }
 
+TEST_F(QuickTimeClipContentHash, StopsAtATrackWithoutItsCommonInterface) {
+    parser->AddAudioTrack(2);
+    Load();
+    struct {
+        FakeCalls* track;
+        const char* expression;
+    } const kTracks[] = {
+        {&Video(), "pVideoTrack->QueryInterface(IID_ITrackInfo, (void**)pTrack.outArg())"},
+        {parser->audioTracks[0],
+         "pAudioTrack->QueryInterface(IID_ITrackInfo, (void**)pTrack.outArg())"}};
+    for (const auto& step : kTracks) {
+        step.track->results["QueryInterface"] = NCF_E_NOINTERFACE;
+        log->clear();
+        EXPECT_EQ(Ask(), NCF_E_NOINTERFACE);
+        ASSERT_EQ(log->records().size(), 1u);
+        EXPECT_NE(log->records()[0].text.find(step.expression), std::string::npos);
+        EXPECT_EQ(content, Part(100, 300)) << "what was gathered so far";
+        step.track->results.clear();
+    }
+}
+
+TEST_F(QuickTimeClipContentHash, AFileThatIsGoneIsThrown) {
+    Load();
+    RecordingNMALog lines(1);
+    std::remove(file.path().c_str());
+    try {
+        Ask();
+        ADD_FAILURE() << "nothing was thrown";
+    } catch (NCFRESULT thrown) {
+        EXPECT_EQ(thrown, NCF_E_HANDLE);
+    }
+    EXPECT_TRUE(content.empty());
+}
+
 TEST_F(QuickTimeClipContentHash, GivesCopiesOfAMovieOneIdentity) {
     Load();
     ASSERT_EQ(Ask(), NCF_OK);

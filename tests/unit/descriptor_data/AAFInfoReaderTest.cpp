@@ -265,6 +265,10 @@ TEST_F(AAFInfoReaderTest, EveryFailureOfLoadingIsThrownAsOneResult) {
     host.clearRefusals();
     host.refuseCreation(kCLSID_SaxParser, NCF_E_OUTOFMEMORY);
     EXPECT_EQ(thrown(good), NCF_E_FAIL);
+    host.clearRefusals();
+    UseScript();
+    script.setErrorHandler = 1;
+    EXPECT_EQ(thrown(good), NCF_E_FAIL) << "any result but 0";
 }
 
 TEST_F(AAFInfoReaderTest, ADescriptorBeforeTheFirstEntryIsAFailure) {

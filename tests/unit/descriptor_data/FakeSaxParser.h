@@ -52,7 +52,7 @@ public:
     NCFRESULT GetLastMessage(INCFString** text) override {
         journal_->add("parser GetLastMessage");
         *text = nullptr;
-        if (script_.lastMessageResult == NCF_OK) {
+        if (script_.lastMessageResult >= 0) {
             *text = MakeHostString(script_.lastMessage);
         }
         return script_.lastMessageResult;

@@ -173,6 +173,14 @@ TEST_F(FourCharReaderTest, TheShortLookupAsksTheFileAlone) {
     EXPECT_EQ(id, 3u);
 }
 
+TEST_F(FourCharReaderTest, OnlyANegativeResultOfTheParseThrows) {
+    UseScript();
+    script.setErrorHandler = 1;
+    EXPECT_NO_THROW(Load(Mapping("FourChar='apch' vcid='1'")));
+    script.setErrorHandler = NCF_E_ABORT;
+    EXPECT_THROW(Load(""), NCFRESULT);
+}
+
 TEST_F(FourCharReaderTest, AFileThatCannotBeReadMakesTheConstructorThrow) {
     const auto thrown = [this](const std::string& path) {
         try {
@@ -268,6 +276,7 @@ TEST_F(BuiltInTable, SeparatesRowsOfOneRasterByRate) {
     EXPECT_EQ(Id("NVj2", 720, 496, 0, {25, 1}), 0u);
     EXPECT_EQ(Id("NVj2", 1920, 1080, 0, {50, 2}), 0u) << "rates are not reduced";
     EXPECT_EQ(Id("NVj2", 1280, 720, 0, {120000, 2002}), 0u);
+    EXPECT_EQ(Id("NVj2", 1920, 1080, 0, {24000, 1000}), 0u) << "both words count";
 }
 
 TEST_F(BuiltInTable, TwoRowsWithFieldsTakeAnyRate) {

@@ -271,6 +271,23 @@ TEST_F(ContainerTest, AnEmptyLeafTakesTheNextText) {
     EXPECT_STREQ(Child(Entries("1")[0], "Leaf")->ValueText(), "\n  ");
 }
 
+TEST_F(ContainerTest, AnEmptyLeafWaitsNoLongerThanItsEntry) {
+    Entry("1");
+    Open("Leaf");
+    Entry("2");
+    Open("Leaf");
+    container_.End();
+    Put("behind the end");
+    EXPECT_STREQ(Child(Entries("2")[0], "Leaf")->ValueText(), "");
+
+    Open("Entry");
+    Open("Leaf");
+    Open("Entry");
+    Put("\n  ");
+    container_.End();
+    EXPECT_STREQ(Entries("2").back()->ValueText(), "") << "an entry has no value";
+}
+
 TEST_F(ContainerTest, AnAttributeIsAChildElement) {
     Open("Entry");
     Open("Info");

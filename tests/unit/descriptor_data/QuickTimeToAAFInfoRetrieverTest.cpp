@@ -195,6 +195,16 @@ TEST_F(RetrieverTest, AnUnknownCodeIsToldToLogAndConsole) {
               1);
 }
 
+TEST_F(RetrieverTest, TheVendorIsComparedInTheOrderOfItsText) {
+    EXPECT_EQ(Init(Entry("5", "CDCI", Join(CDCIValues())),
+                   "<FourCharMapping FourChar='code' Vendor='lppa' vcid='4'/>"
+                   "<FourCharMapping FourChar='code' Vendor='appl' vcid='5'/>"
+                   "<FourCharMapping FourChar='code' vcid='6'/>"),
+              NCF_OK);
+    EXPECT_EQ(GetInfo(), NCF_OK);
+    EXPECT_EQ(id_, 5u);
+}
+
 TEST_F(RetrieverTest, WithoutIdTheMovieItselfIsAsked) {
     EXPECT_EQ(Init(Entry("9", "CDCI", Join(CDCIValues())), "<FourCharMapping FourChar='code'/>"),
               NCF_OK);

@@ -236,15 +236,19 @@ protected:
         broken.erase("VideoLineMap");
         Values brokenCDCI = CDCIValues();
         brokenCDCI.erase("VideoLineMap");
+        Values brokenMPEG2 = MPEG2Values();
+        brokenMPEG2.erase("MaxGOP");
         EXPECT_EQ(Init(Entry("1", "CDCI", Join(CDCIValues())) +
                            Entry("2", "MPEG2Video", Join(MPEG2Values())) +
                            Entry("3", "RGBA", Join(RGBAValues())) +
-                           Entry("4", "RGBA", Join(broken)) + Entry("5", "CDCI", Join(brokenCDCI)),
+                           Entry("4", "RGBA", Join(broken)) + Entry("5", "CDCI", Join(brokenCDCI)) +
+                           Entry("6", "MPEG2Video", Join(brokenMPEG2)),
                        "<FourCharMapping FourChar='cdci' vcid='1'/>"
                        "<FourCharMapping FourChar='mpeg' vcid='2'/>"
                        "<FourCharMapping FourChar='rgba' vcid='3'/>"
                        "<FourCharMapping FourChar='brgb' vcid='4'/>"
-                       "<FourCharMapping FourChar='bcdc' vcid='5'/>"),
+                       "<FourCharMapping FourChar='bcdc' vcid='5'/>"
+                       "<FourCharMapping FourChar='bmpg' vcid='6'/>"),
                   NCF_OK);
     }
     NCFRESULT Read(ncfUInt32 code) {
@@ -279,6 +283,11 @@ TEST_F(RetrieverFlags, RGBAIsSetAtTheFirstGetterAndStaysWhenALaterOneFails) {
 TEST_F(RetrieverFlags, MPEGIsSetOnlyAfterAllGetters) {
     EXPECT_EQ(Read(Code("mpeg")), NCF_OK);
     EXPECT_EQ(Read(Code("bcdc")), NCF_E_PARAMETERNOTAVAILABLE);
+    EXPECT_TRUE(IsMPEG());
+}
+
+TEST_F(RetrieverFlags, MPEGIsSetBeforeTheValuesThatOnlyMPEGHas) {
+    EXPECT_EQ(Read(Code("bmpg")), NCF_E_PARAMETERNOTAVAILABLE);
     EXPECT_TRUE(IsMPEG());
 }
 

@@ -102,9 +102,11 @@ TEST_F(XMLParserHelpersTest, AFailureWithoutMessageIsNotLogged) {
     EXPECT_EQ(Parse(), NCF_E_NOTFOUND);
     EXPECT_TRUE(log.records().empty());
     script.lastMessage = "unread";
-    script.lastMessageResult = NCF_E_FAIL;
-    EXPECT_EQ(Parse(), NCF_E_NOTFOUND);
-    EXPECT_TRUE(log.records().empty());
+    for (const NCFRESULT result : {NCF_E_FAIL, 1}) {
+        script.lastMessageResult = result;
+        EXPECT_EQ(Parse(), NCF_E_NOTFOUND);
+        EXPECT_TRUE(log.records().empty());
+    }
 }
 
 TEST_F(XMLParserHelpersTest, APositiveAnswerToParseIsSuccess) {

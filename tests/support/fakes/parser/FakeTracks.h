@@ -23,6 +23,15 @@ public:
     ncfUInt32 descriptionCount = 1;
     FakeSampleTable* table;
 
+    // Silent: only a refusal is looked up.
+    NCFRESULT QueryInterface(const GUID& iid, void** out) override {
+        const auto refusal = results.find("QueryInterface");
+        if (refusal == results.end()) {
+            return FakeObject<Interface, Answers...>::QueryInterface(iid, out);
+        }
+        *out = nullptr;
+        return refusal->second;
+    }
     NCFRESULT ReservedTrack3() override { return NCF_E_NOTIMPL; }
     NCFRESULT ReservedTrack4() override { return NCF_E_NOTIMPL; }
     NCFRESULT ReservedTrack5() override { return NCF_E_NOTIMPL; }

@@ -73,7 +73,8 @@ TEST_F(SampleProviderPolicy, IsNativeWhenTheRetrieverKnowsThePicture) {
 }
 
 TEST_F(SampleProviderPolicy, ProvidesSilentlyWhatTheRetrieverDoesNotKnow) {
-    for (const NCFRESULT result : {NCF_E_NOTSUPPORTED, NCF_E_PARAMETERNOTAVAILABLE, NCF_E_FAIL}) {
+    for (const NCFRESULT result :
+         {NCF_E_NOTSUPPORTED, NCF_E_PARAMETERNOTAVAILABLE, NCF_E_FAIL, 1}) {
         retriever.result = result;
         EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
     }

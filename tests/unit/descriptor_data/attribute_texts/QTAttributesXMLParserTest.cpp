@@ -107,6 +107,21 @@ TEST_F(AttributeTexts, MissingElementReadsEmptyWithOneLine) {
     EXPECT_NE(log.records()[0].text.find("Element with tag <MinReference> is missing!"),
               std::string::npos);
     EXPECT_EQ(log.records()[0].where, "ParseHelperFunctions::QTAttributesXMLParser::_ReadElement");
+    EXPECT_EQ(log.records()[0].kind, 1u);
+}
+
+TEST_F(AttributeTexts, ElementsAreReadInTheirOrderAndARequiredOneThrowsWithoutALine) {
+    RecordingLog log(host);
+    ColorSpaceDescriptor colour;
+    EXPECT_EQ(colourOf("<Other/>", colour), NCF_E_UNEXPECTED);
+    std::vector<std::string> missing;
+    for (const LoggedRecord& record : log.records()) {
+        const std::size_t start = record.text.find('<') + 1;
+        missing.push_back(record.text.substr(start, record.text.find('>') - start));
+    }
+    EXPECT_EQ(missing, (std::vector<std::string>{"Name", "BitDepth", "MinReference", "MaxReference",
+                                                 "TransferCharacteristicName"}));
+    EXPECT_EQ(TextOf(colour.transferCharacteristicName.inArg()), "Empty");
 }
 
 TEST_F(AttributeTexts, EmptyElementReadsEmptyWithOneLine) {
@@ -147,6 +162,9 @@ TEST_F(AttributeTexts, LabelIsReadInEitherCase) {
     EXPECT_TRUE(StringToGUID(NMAString("abcdef01-2345-6789-abcd-ef0123456789"), &id));
     EXPECT_TRUE(id == ncfGuid("ABCDEF01-2345-6789-ABCD-EF0123456789"));
     EXPECT_FALSE(StringToGUID(NMAString("0E170000-0001-0101-060E"), &id));
+    EXPECT_FALSE(StringToGUID(NMAString("0E170000-0001-0101-060E-2B3404010"), &id))
+        << "ten numbers";
+    EXPECT_TRUE(id == ncfGuid("ABCDEF01-2345-6789-ABCD-EF0123456789"));
     EXPECT_FALSE(StringToGUID(NMAString(""), &id));
 }
 
