@@ -74,17 +74,17 @@ template <class Wanted>
 void NMAXmlElement::remove(const NMAString& name, Wanted wanted) {
     std::vector<NMAXmlElement*> unwanted;
     collect(name, wanted, unwanted);
-    for (std::size_t i = children_.size(); i-- > 0;) {
-        for (const NMAXmlElement* element : unwanted) {
-            if (children_[i] == element) {
-                DropChildAt(i);
-                break;
-            }
+    if (unwanted.empty()) {
+        return;
+    }
+    // They stand in the list's order, so the last of them is met first.
+    for (std::size_t i = children_.size(); i-- > 0 && !unwanted.empty();) {
+        if (children_[i] == unwanted.back()) {
+            DropChildAt(i);
+            unwanted.pop_back();
         }
     }
-    if (!unwanted.empty()) {
-        SetChanged();
-    }
+    SetChanged();
 }
 
 ncfUInt32 NMAXmlElement::CountChildren(const NMAString& name) {
