@@ -7,6 +7,8 @@
 // them nothing changes.
 
 #include <benchmark/benchmark.h>
+#include <fcntl.h>
+#include <unistd.h>
 
 #include <cstdio>
 #include <cstdlib>
@@ -51,32 +53,42 @@ void Describe(benchmark::State& state) {
     }
 }
 
+// The header's bytes, past the system's cache as the module reads them, where
+// the file system allows that.
 void ReadAndHash(benchmark::State& state) {
     const LongMovieFile& file = FileOf(state.range(0));
+    constexpr std::uint64_t kSector = 4096;
     constexpr std::uint64_t kPiece = 1 << 20;
+    const std::uint64_t start = file.HeaderPosition() / kSector * kSector;
+    const std::uint64_t size = file.HeaderPosition() + file.HeaderSize() - start;
+    const std::unique_ptr<void, void (*)(void*)> buffer(std::aligned_alloc(kSector, kPiece),
+                                                        std::free);
     for (auto _ : state) {
-        std::FILE* const stream = std::fopen(file.Path().c_str(), "rb");
-        std::vector<unsigned char> bytes(file.HeaderSize());
-        std::fseek(stream, static_cast<long>(file.HeaderPosition()), SEEK_SET);
-        for (std::uint64_t at = 0; at < bytes.size(); at += kPiece) {
-            const std::size_t wanted = std::min(kPiece, bytes.size() - at);
-            if (std::fread(bytes.data() + at, 1, wanted, stream) != wanted) {
-                state.SkipWithError("the header can't be read");
-                break;
-            }
+        int descriptor = open(file.Path().c_str(), O_RDONLY | O_DIRECT);
+        if (descriptor < 0) {
+            descriptor = open(file.Path().c_str(), O_RDONLY);
         }
-        std::fclose(stream);
         void* digest = nullptr;
         GUID id{};
         GenerateUMIDFromData_Begin(&digest);
-        GenerateUMIDFromData_AddData(&digest, static_cast<ncfUInt32>(bytes.size()), bytes.data());
+        for (std::uint64_t at = 0; at < size; at += kPiece) {
+            const ssize_t got =
+                pread(descriptor, buffer.get(), kPiece, static_cast<off_t>(start + at));
+            if (got <= 0) {
+                state.SkipWithError("the header can't be read");
+                break;
+            }
+            GenerateUMIDFromData_AddData(&digest, static_cast<ncfUInt32>(got),
+                                         static_cast<const unsigned char*>(buffer.get()));
+        }
         GenerateUMIDFromData_Finish(&digest, &id);
+        close(descriptor);
         benchmark::DoNotOptimize(id);
     }
 }
 
 void Ffprobe(benchmark::State& state) {
-    const std::string command = "ffprobe -v quiet -show_format -show_streams '" +
+    const std::string command = "ffprobe -v error -show_format -show_streams '" +
                                 FileOf(state.range(0)).Path().string() + "' > /dev/null";
     for (auto _ : state) {
         if (std::system(command.c_str()) != 0) {

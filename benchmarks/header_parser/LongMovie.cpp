@@ -7,9 +7,11 @@
 movies::Movie LongMovie(std::uint64_t samples) {
     constexpr std::int32_t kOffsets[] = {100, 300, 0, 0};
     movies::Movie movie;
-    movie.timeScale = 2500;
+    movie.timeScale = 12000;
     movie.largeMedia = true;
-    movies::Track track = movies::VideoTrack(movies::VideoFormat(), 0, 2500, 100);
+    movies::VideoFormat format;
+    format.codec = "apcn";
+    movies::Track track = movies::VideoTrack(format, 0, 12000, 100);
     track.samples.clear();
     track.samples.reserve(samples);
     std::uint32_t random = 1;

@@ -7,9 +7,9 @@
 
 #include "tests/support/movies/Movie.h"
 
-// A movie of `samples` pictures that makes the tables long: a size and a
-// display offset for each sample, ten samples in a chunk, a sync sample in
-// twelve. Its media are a hole.
+// A movie of `samples` pictures, 120 a second so that no length goes beyond a day, that makes the
+// tables long: a size and a display offset for each sample, ten samples in a chunk, a sync sample
+// in twelve. Its media are a hole.
 movies::Movie LongMovie(std::uint64_t samples);
 
 // The same as a sparse file in the temporary folder, gone with the object.

@@ -121,7 +121,8 @@ std::string DiagnoseMovie(const std::filesystem::path& movie) {
     if (header_parser::ReadHeaders(*parser, readAt) < 0) {
         return fmt::format("the movie header can't be used: {}", parser->Refusal().reason);
     }
-    return "the movie header can be read, but holds no picture or sound of a length above 0";
+    return "the movie header can be read, but the movie has no length above 0, or is longer than "
+           "the 24 hours that its timecode can count";
 }
 
 }  // namespace cliphost
