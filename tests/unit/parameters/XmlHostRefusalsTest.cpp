@@ -155,6 +155,17 @@ TEST_F(XmlHostRefusals, ARefusedIdentityIsThrown) {
     EXPECT_EQ(Thrown([&] { element->AddChild(twin.get()); }), NCF_E_ABORT);
     EXPECT_EQ(Thrown([&] { element->RemoveChildForHostNode(&child); }), NCF_E_ABORT);
     EXPECT_EQ(element->Children().size(), 2u);
+    child.results.clear();
+    x.results["query identity"] = NCF_E_ABORT;
+    EXPECT_EQ(Thrown([&] { element->AddChild(twin.get()); }), NCF_E_ABORT) << "of one on the way";
+}
+
+TEST_F(XmlHostRefusals, AChildRemovedByItsHostNodeLetsThatGo) {
+    Element* const element = Load();
+    EXPECT_NE(element->FindChild(S("child"), 0), nullptr);
+    EXPECT_EQ(child.references, 1);
+    element->RemoveChildForHostNode(&child);
+    EXPECT_EQ(child.references, 0);
 }
 
 TEST_F(XmlHostRefusals, AHostNodeOfAnotherTypeMakesNoChild) {
