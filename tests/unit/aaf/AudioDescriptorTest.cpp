@@ -110,6 +110,19 @@ TEST_F(AudioDescriptorTest, AFractionalRateIsCut) {
     EXPECT_TRUE(aaf.has("PCMDescriptor1.SetAverageBPS 1411216"));
 }
 
+TEST_F(AudioDescriptorTest, TheAverageIsRounded) {
+    Track().metadata.bytesPerPacket = 1;
+    Track().metadata.sampleRate = 8000.1;  // 64000.8 bits in a second
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("PCMDescriptor1.SetAverageBPS 64001"));
+    Track().native = 0;
+    wrapper.bytesPerPacket = 1;
+    wrapper.sampleRate = 8000.1;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("PCMDescriptor2.SetAverageBPS 64001"));
+    EXPECT_TRUE(aaf.has("PCMDescriptor2.SetAudioSamplingRate 8000/1"));
+}
+
 TEST_F(AudioDescriptorTest, NumbersTooLargeKeepTheirLowBits) {
     Track().metadata.bytesPerPacket = 0x10001;
     Track().metadata.channelsPerFrame = 0x20003;
@@ -172,6 +185,42 @@ TEST_F(AudioDescriptorTest, TellsTrackChannelsAndBits) {
 TEST_F(AudioDescriptorTest, ARefusedCellDoesNotEndTheClip) {
     aaf.refuse("MasterMob1.AppendComment");
     EXPECT_EQ(Add(), NCF_OK);
+}
+
+TEST_F(AudioDescriptorTest, AMasterMobIsNotNeeded) {
+    EXPECT_EQ(AddAudioDescriptor(Media(), 0, Console(), nullptr, Dictionary(), multi, slots),
+              NCF_OK);
+    EXPECT_TRUE(log.contains("CHK_INARG(pMobMasterMob)NMA::Impl::AddBinColumnEntry"));
+    EXPECT_TRUE(aaf.has("MultipleDescriptor1.AppendFileDescriptor PCMDescriptor1"));
+}
+
+TEST_F(AudioDescriptorTest, EachRoadAsksItsOwnSource) {
+    const std::vector<std::string> length = {"clip GetAudioTrackMetadata",
+                                             "clip CalculateAudioTrackLengthInSamples",
+                                             "clip GetEditRate", "clip GetMovieLength"};
+    std::vector<std::string> native = {"clip GetAudioTrackQTId", "clip IsAudioSampleProviderMedia",
+                                       "clip GetAudioTrackMetadata"};
+    std::vector<std::string> provided = {"clip GetAudioTrackQTId",
+                                         "clip IsAudioSampleProviderMedia"};
+    native.insert(native.end(), length.begin(), length.end());
+    provided.insert(provided.end(), length.begin(), length.end());
+    journal.clear();
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(journal.startingWith("clip "), native);
+    EXPECT_EQ(journal.startingWith("wrapper "), std::vector<std::string>{});
+    Track().native = 0;
+    journal.clear();
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(journal.startingWith("clip "), provided);
+    EXPECT_EQ(journal.startingWith("wrapper "),
+              (std::vector<std::string>{"wrapper NewMovieFromFilePath",
+                                        "wrapper GetAudioInfoForTrack 2"}));
+}
+
+TEST_F(AudioDescriptorTest, AFailureBehindTheTracksFormLeavesTheChannelsTold) {
+    aaf.refuse("PCMDescriptor1.SetCompression");
+    EXPECT_LT(Add(), 0);
+    EXPECT_EQ(slots, 2u);
 }
 
 TEST_F(AudioDescriptorTest, ARefusedDescriptorIsThrown) {

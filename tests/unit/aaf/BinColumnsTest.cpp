@@ -5,6 +5,7 @@
 
 #include "source/aaf/BinColumnMapping.h"
 #include "tests/unit/aaf/support/AAFTest.h"
+#include "tests/unit/aaf/support/StubbornString.h"
 
 namespace NMA::Impl {
 namespace {
@@ -106,6 +107,25 @@ TEST_F(BinColumnsTest, ACodecThatCannotBeNamedStopsTheClip) {
     EXPECT_EQ(AddVideo(), NCF_E_FAIL);
     EXPECT_EQ(host.console().count(1, "Appropriate QuickTime decompressor wasn't found!\n"), 1);
     EXPECT_TRUE(log.contains("Appropriate QuickTime decompressor wasn't found!"));
+    EXPECT_EQ(aaf.callCount(), 0);
+}
+
+TEST_F(BinColumnsTest, ANameThatRefusesToBeReadStopsTheClip) {
+    const std::pair<const char*, const char*> statements[] = {
+        {"ConvertTo", "codecName->ConvertTo(kNCFWCHAR)"},
+        {"GetRawWCHAR", "codecName->GetRawWCHAR(&p_buffer)"},
+        {"FindWCHAR", "codecName->FindWCHAR(badSeed,5,0,&findIndex)"},
+    };
+    for (const auto& [operation, statement] : statements) {
+        NCFSmartPtr<INCFString> name;
+        name.attach(new StubbornString("Apple ProRes", operation, NCF_E_NOTFOUND));
+        clip->codecString = name.inArg();
+        EXPECT_EQ(AddVideo(), NCF_E_NOTFOUND) << operation;
+        EXPECT_EQ(
+            log.count(ReturnRecord(NCF_E_NOTFOUND, statement, "NMA::Impl::AddVideoBinColumnEntry")),
+            1);
+        clip->codecString = nullptr;
+    }
     EXPECT_EQ(aaf.callCount(), 0);
 }
 

@@ -56,6 +56,7 @@ public:
     ncfUInt32 layout = 0;
     NCFRESULT layoutResult = NCF_OK;
     std::string codecName = "H.264";
+    INCFString* codecString = nullptr;  // given in place of the name when set
     std::vector<ncfUInt8> content = {1, 2, 3, 4};
     // Operation -> failure.
     std::map<std::string, NCFRESULT> failures;
@@ -115,7 +116,10 @@ public:
     }
     NCFRESULT GetCodecName(ncfUInt32, NCFSmartPtr<INCFString>& out) override {
         const NCFRESULT result = told("GetCodecName");
-        if (result >= 0) {
+        if (result >= 0 && codecString) {
+            codecString->AddRef();
+            out.attach(codecString);
+        } else if (result >= 0) {
             out.attach(MakeHostString(codecName));
         }
         return result;
