@@ -93,6 +93,9 @@ public:
     PropertyValue* RequireValue(const PropertyKey& key);
     // Sets or replaces a value object; the owner of what it contains becomes this object.
     HRESULT PutValue(PropertyId pid, PropertyValue* value);
+    // Told when a value of this object comes, goes or is about to change. An object that joins a
+    // list at its end is not told.
+    virtual void OnValueChange(const PropertyValue&) {}
 
     // -- Plain values.
     HRESULT PutInteger(const PropertyKey& key, aafInt64 value);

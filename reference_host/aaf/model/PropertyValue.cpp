@@ -44,6 +44,12 @@ void PropertyValue::Detach(Object& object) {
     }
 }
 
+void PropertyValue::TellHolder() {
+    if (holder_ != nullptr) {
+        holder_->OnValueChange(*this);
+    }
+}
+
 HRESULT PropertyValue::InsertObject(std::size_t index, Object* object) {
     if (object == nullptr) {
         return AAFRESULT_NULL_PARAM;
@@ -51,14 +57,20 @@ HRESULT PropertyValue::InsertObject(std::size_t index, Object* object) {
     if (object->model() != model()) {
         return AAFRESULT_OBJECT_ALREADY_ATTACHED;
     }
-    // Twice in one list would leave it with two owners as soon as the list is set on an object.
-    const bool twice = type_->form() != ValueForm::StrongReference &&
-                       std::any_of(objects_.begin(), objects_.end(),
-                                   [&](const RefPtr<Object>& at) { return at.get() == object; });
-    const bool owned =
-        holder_ != nullptr && (object->owner() != nullptr || IsWithin(object, holder_));
-    if (twice || owned) {
+    // What stands in a held list already has the holder for its owner. A free list has to be
+    // searched: twice in it would leave the object with two owners as soon as the list is set on
+    // an object.
+    const bool taken =
+        holder_ != nullptr
+            ? object->owner() != nullptr || IsWithin(object, holder_)
+            : type_->form() != ValueForm::StrongReference &&
+                  std::any_of(objects_.begin(), objects_.end(),
+                              [&](const RefPtr<Object>& at) { return at.get() == object; });
+    if (taken) {
         return AAFRESULT_OBJECT_ALREADY_ATTACHED;
+    }
+    if (index < objects_.size()) {
+        TellHolder();
     }
     index = std::min(index, objects_.size());
     objects_.insert(objects_.begin() + static_cast<std::ptrdiff_t>(index), RefPtr<Object>(object));
@@ -70,6 +82,7 @@ HRESULT PropertyValue::InsertObject(std::size_t index, Object* object) {
 
 void PropertyValue::RemoveObjectAt(std::size_t index) {
     const RefPtr<Object> object = objects_[index];
+    TellHolder();
     if (holder_ != nullptr) {
         Detach(*object);
     }
@@ -83,6 +96,7 @@ void PropertyValue::ClearObjects() {
 }
 
 void PropertyValue::SortByKey() {
+    TellHolder();
     std::stable_sort(objects_.begin(), objects_.end(),
                      [](const RefPtr<Object>& left, const RefPtr<Object>& right) {
                          return left->UniqueKey() < right->UniqueKey();
@@ -100,6 +114,7 @@ HRESULT PropertyValue::EnterObject(Object& holder) {
     for (const RefPtr<Object>& object : objects_) {
         Attach(*object, holder);
     }
+    TellHolder();
     return AAFRESULT_SUCCESS;
 }
 
@@ -107,6 +122,7 @@ void PropertyValue::LeaveObject() {
     if (holder_ == nullptr) {
         return;
     }
+    TellHolder();
     holder_ = nullptr;
     for (const RefPtr<Object>& object : objects_) {
         Detach(*object);

@@ -34,7 +34,10 @@ public:
     bool HoldsObjects() const;
 
     const Bytes& bytes() const { return bytes_; }
-    Bytes& bytes() { return bytes_; }
+    Bytes& bytes() {
+        TellHolder();
+        return bytes_;
+    }
 
     // Contained objects. They are attached to the object that this value stands in.
     const std::vector<RefPtr<Object>>& objects() const { return objects_; }
@@ -68,6 +71,7 @@ protected:
 private:
     static void Attach(Object& object, Object& owner);
     static void Detach(Object& object);
+    void TellHolder();
 
     TypeDefinition* type_;
     Bytes bytes_;

@@ -32,13 +32,24 @@ MobSlot* Mob::SlotAt(aafUInt32 index) const {
 
 MobSlot* Mob::FindSlot(aafSlotID_t slotId) const {
     const aafUInt32 count = CountObjects(prop::Mob_Slots);
-    for (aafUInt32 at = 0; at < count; ++at) {
-        MobSlot* const slot = SlotAt(at);
-        if (slot != nullptr && slot->id() == slotId) {
-            return slot;
+    for (; slotsSeen_ < count; ++slotsSeen_) {
+        if (const MobSlot* const slot = SlotAt(slotsSeen_)) {
+            slotPlaces_.emplace(slot->id(), slotsSeen_);
         }
     }
-    return nullptr;
+    const auto found = slotPlaces_.find(slotId);
+    return found == slotPlaces_.end() ? nullptr : SlotAt(found->second);
+}
+
+void Mob::ForgetSlotIds() {
+    slotPlaces_.clear();
+    slotsSeen_ = 0;
+}
+
+void Mob::OnValueChange(const PropertyValue& value) {
+    if (value.HoldsObjects()) {
+        ForgetSlotIds();
+    }
 }
 
 HRESULT Mob::GetMobID(aafMobID_t* mobID) {

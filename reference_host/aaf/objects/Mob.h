@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <unordered_map>
+
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "reference_host/aaf/model/NotImplementedMobs.h"
 #include "reference_host/aaf/model/Object.h"
@@ -20,7 +22,11 @@ public:
     // What the mob counts as; below zero when it counts as none.
     virtual aafMobKind_t MobKind() const { return -1; }
     MobSlot* SlotAt(aafUInt32 index) const;
+    // The first one with that id.
     MobSlot* FindSlot(aafSlotID_t slotId) const;
+    // A slot of this mob has, or may have, another id from now on.
+    void ForgetSlotIds();
+    void OnValueChange(const PropertyValue& value) override;
 
     // -- IAAFMob: identity
     HRESULT GetMobID(aafMobID_t* mobID) override;
@@ -89,6 +95,12 @@ protected:
     // A timeline slot at the end with a segment that nobody owns yet.
     HRESULT AppendTimelineSlot(aafRational_t editRate, Object& segment, aafSlotID_t slotId,
                                const wchar_t* name);
+
+private:
+    // Where the first slot of each id stands, for the slots that were looked at so far. A mob may
+    // have tens of thousands, one for each channel of a sound track.
+    mutable std::unordered_map<aafSlotID_t, aafUInt32> slotPlaces_;
+    mutable aafUInt32 slotsSeen_ = 0;
 };
 
 }  // namespace aaf

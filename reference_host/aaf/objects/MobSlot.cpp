@@ -2,13 +2,25 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/aaf/objects/MobSlot.h"
 
+#include "reference_host/aaf/model/TypeDefinition.h"
 #include "reference_host/aaf/objects/Component.h"
+#include "reference_host/aaf/objects/Mob.h"
 
 namespace aaf {
 
 void MobSlot::SetDefaults() {
     Object::SetDefaults();
     PutInteger(prop::MobSlot_SlotID, 0);
+}
+
+// Any number may be the id: a value does not know which property it stands for.
+void MobSlot::OnValueChange(const PropertyValue& value) {
+    if (owner() == nullptr || value.HoldsObjects() || value.type().kind() == TypeKind::String) {
+        return;
+    }
+    if (Mob* const mob = dynamic_cast<Mob*>(owner())) {
+        mob->ForgetSlotIds();
+    }
 }
 
 Segment* MobSlot::segment() const {

@@ -14,6 +14,7 @@ class Segment;
 class MobSlot : public Implements<Object, IAAFMobSlot> {
 public:
     void SetDefaults() override;
+    void OnValueChange(const PropertyValue& value) override;
 
     HRESULT GetSegment(IAAFSegment** result) override;
     HRESULT SetName(aafCharacter_constptr name) override;

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include <cstring>
 
+#include <chrono>
+
 #include "tests/unit/aaf_library/objects/TransientFile.h"
 
 namespace aaf_test {
@@ -177,6 +179,80 @@ TEST_F(Mob, FindsTheFirstSlotWithAnId) {
     EXPECT_EQ(AAFRESULT_SLOT_NOT_FOUND, mob->LookupSlot(5, &out));
     EXPECT_EQ(nullptr, out);
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->LookupSlot(4, nullptr));
+}
+
+TEST_F(Mob, FindsSlotsByTheIdsThatTheyHaveNow) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+    const auto append = [&](aafSlotID_t id) {
+        Ptr<IAAFTimelineMobSlot> slot;
+        EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(Clip(1)),
+                                                                id, L"", 0, slot.Out()));
+        return As<IAAFMobSlot>(slot);
+    };
+    const auto found = [&](aafSlotID_t id) {
+        Ptr<IAAFMobSlot> slot;
+        mob->LookupSlot(id, slot.Out());
+        return slot;
+    };
+    const Ptr<IAAFMobSlot> first = append(1);
+    const Ptr<IAAFMobSlot> second = append(2);
+    EXPECT_EQ(second.get(), found(2).get());
+
+    // By the slot's own operation.
+    EXPECT_EQ(AAFRESULT_SUCCESS, first->SetSlotID(2));
+    EXPECT_EQ(first.get(), found(2).get());
+    EXPECT_EQ(nullptr, found(1).get());
+
+    // By its place in the list.
+    const Ptr<IAAFMobSlot> third = append(3);
+    EXPECT_EQ(third.get(), found(3).get());
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->RemoveSlotAt(0));
+    EXPECT_EQ(second.get(), found(2).get());
+    EXPECT_EQ(third.get(), found(3).get());
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->PrependSlot(first));
+    EXPECT_EQ(first.get(), found(2).get());
+    EXPECT_EQ(third.get(), found(3).get());
+
+    // By the value that stands in the slot, and by another one in its stead.
+    Ptr<IAAFClassDef> slots;
+    Ptr<IAAFPropertyDef> property;
+    Ptr<IAAFTypeDef> type;
+    Ptr<IAAFPropertyValue> value;
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupClassDef(AUID_AAFMobSlot, slots.Out()));
+    const aafUID_t slotId = ncfGuid("01070101-0000-0000-060E-2B3401010102");
+    ASSERT_EQ(AAFRESULT_SUCCESS, slots->LookupPropertyDef(slotId, property.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(kAAFTypeID_UInt32, type.Out()));
+    const Ptr<IAAFTypeDefInt> integers = As<IAAFTypeDefInt>(type);
+    const Ptr<IAAFObject> object = As<IAAFObject>(first);
+    aafUInt32 number = 7;
+    ASSERT_EQ(AAFRESULT_SUCCESS, object->GetPropertyValue(property, value.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              integers->SetInteger(value, reinterpret_cast<aafMemPtr_t>(&number), sizeof number));
+    EXPECT_EQ(first.get(), found(7).get());
+    EXPECT_EQ(second.get(), found(2).get());
+    number = 9;
+    ASSERT_EQ(AAFRESULT_SUCCESS, integers->CreateValue(reinterpret_cast<aafMemPtr_t>(&number),
+                                                       sizeof number, value.Out()));
+    ASSERT_EQ(AAFRESULT_SUCCESS, object->SetPropertyValue(property, value));
+    EXPECT_EQ(first.get(), found(9).get());
+    EXPECT_EQ(nullptr, found(7).get());
+}
+
+// A track of sound may claim tens of thousands of channels, each with a slot.
+TEST_F(Mob, TakesAndFindsManySlotsInGoodTime) {
+    constexpr aafSlotID_t kSlots = 20000;
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFSourceMob);
+    const Ptr<IAAFSourceMob> source = As<IAAFSourceMob>(mob);
+    const Ptr<IAAFDataDef> sound = DataDef(kAAFDataDef_LegacySound);
+    const auto start = std::chrono::steady_clock::now();
+    for (aafSlotID_t id = 1; id <= kSlots; ++id) {
+        ASSERT_EQ(AAFRESULT_SUCCESS, source->AddNilReference(id, 10, sound, {25, 1}));
+        Ptr<IAAFMobSlot> slot;
+        ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(id, slot.Out()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, slot->SetName(L""));
+    }
+    // Looking through all slots each time takes more than a minute.
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(20));
 }
 
 TEST_F(Mob, KeepsSlotsInOrderAndFreesRemovedOnes) {
