@@ -7,6 +7,7 @@
 
 #include "host_interfaces/framework/Unknown.h"
 #include "reference_host/framework/ObjectCount.h"
+#include "reference_host/framework/QueryRule.h"
 
 namespace host {
 
@@ -27,6 +28,11 @@ public:
     NCFRESULT QueryInterface(const GUID& iid, void** out) override {
         if (out == nullptr) {
             return NCF_E_POINTER;
+        }
+        *out = nullptr;
+        const NCFRESULT allowed = AskQueryRule(iid);
+        if (allowed < 0) {
+            return allowed;
         }
         *out = FindInterface(iid);
         if (*out == nullptr) {

@@ -58,3 +58,22 @@ TEST(Component, CountsReferencesFromManyThreads) {
     settings.Reset();
     EXPECT_EQ(before, host::LiveObjectCount());
 }
+
+TEST(Component, AsksTheRuleBeforeItAnswersAQuestion) {
+    const Ref<Settings> settings = MakeRef<Settings>();
+    std::vector<ncfUInt32> numbers;
+    host::SetQueryRule([&numbers](const GUID& iid, ncfUInt32 number) {
+        numbers.push_back(number);
+        return iid == NMA::IID_IHostSettings ? NCF_E_ACCESSDENIED : NCF_OK;
+    });
+    void* out = settings.get();
+    EXPECT_EQ(NCF_E_ACCESSDENIED, settings->QueryInterface(NMA::IID_IHostSettings, &out));
+    EXPECT_EQ(nullptr, out);
+    Ref<INCFUnknown> root;
+    EXPECT_EQ(NCF_OK, host::Query(settings->Identity(), root));
+    EXPECT_EQ((std::vector<ncfUInt32>{1, 2}), numbers);
+    host::SetQueryRule({});
+    Ref<NMA::IHostSettings> again;
+    EXPECT_EQ(NCF_OK, host::Query(settings->Identity(), again));
+    EXPECT_EQ(2u, numbers.size());
+}

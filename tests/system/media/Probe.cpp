@@ -1,0 +1,91 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "tests/system/media/Probe.h"
+
+#include <cstdio>
+#include <cstdlib>
+#include <memory>
+#include <nlohmann/json.hpp>
+
+namespace {
+
+std::string Quoted(const std::string& text) {
+    std::string quoted = "'";
+    for (const char c : text) {
+        quoted += c == '\'' ? std::string("'\\''") : std::string(1, c);
+    }
+    return quoted + "'";
+}
+
+std::string OutputOf(const std::string& command) {
+    const std::unique_ptr<FILE, int (*)(FILE*)> pipe(popen(command.c_str(), "r"), pclose);
+    std::string output;
+    char buffer[4096];
+    for (std::size_t n = 0; pipe && (n = fread(buffer, 1, sizeof buffer, pipe.get())) > 0;) {
+        output.append(buffer, n);
+    }
+    return output;
+}
+
+double Quotient(const std::string& text) {
+    double numerator = 0, denominator = 0;
+    return std::sscanf(text.c_str(), "%lf/%lf", &numerator, &denominator) == 2 && denominator != 0
+               ? numerator / denominator
+               : 0;
+}
+
+double Number(const nlohmann::json& from, const char* name) {
+    return std::atof(from.value(name, "0").c_str());
+}
+
+ProbedStream StreamOf(const nlohmann::json& json) {
+    ProbedStream stream;
+    stream.id = static_cast<std::uint32_t>(std::strtoul(json.value("id", "0").c_str(), nullptr, 0));
+    stream.kind = json.value("codec_type", "");
+    stream.tag = json.value("codec_tag_string", "");
+    stream.width = json.value("width", 0);
+    stream.height = json.value("height", 0);
+    stream.averageRate = Quotient(json.value("avg_frame_rate", "0/0"));
+    stream.start = Number(json, "start_time");
+    stream.duration = Number(json, "duration");
+    stream.samples = static_cast<std::uint64_t>(Number(json, "nb_frames"));
+    stream.sampleRate = static_cast<int>(Number(json, "sample_rate"));
+    stream.channels = json.value("channels", 0);
+    stream.isPicture = json.contains("disposition") && json["disposition"].value("attached_pic", 0);
+    if (json.contains("tags")) {
+        stream.timecode = json["tags"].value("timecode", "");
+    }
+    return stream;
+}
+
+}  // namespace
+
+std::vector<ProbedStream> ProbedFile::Of(const std::string& kind) const {
+    std::vector<ProbedStream> found;
+    for (const ProbedStream& stream : streams) {
+        if (stream.kind == kind && !stream.isPicture) {
+            found.push_back(stream);
+        }
+    }
+    return found;
+}
+
+ProbedFile ProbeFile(const std::filesystem::path& file) {
+    const std::string text = OutputOf(
+        "ffprobe -v quiet -print_format json -show_streams "
+        "-show_format " +
+        Quoted(std::filesystem::absolute(file).string()));
+    ProbedFile probed;
+    const nlohmann::json json = nlohmann::json::parse(text, nullptr, false);
+    if (json.is_discarded() || !json.contains("format")) {
+        return probed;
+    }
+    probed.isReadable = true;
+    probed.format = json["format"].value("format_name", "");
+    probed.duration = Number(json["format"], "duration");
+    for (const nlohmann::json& stream : json.value("streams", nlohmann::json::array())) {
+        probed.streams.push_back(StreamOf(stream));
+    }
+    return probed;
+}
