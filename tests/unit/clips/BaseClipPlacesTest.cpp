@@ -10,6 +10,8 @@
 #include <string>
 
 #include "source/clips/BaseClip.h"
+#include "tests/support/fakes/FakeHost.h"
+#include "tests/support/fakes/RecordingLogger.h"
 
 namespace {
 
@@ -235,4 +237,21 @@ TEST(BaseClip, KeepsItsOperationsInTheirPlaces) {
         }
         EXPECT_EQ(clip.ran, place.operation) << "slot " << place.slot;
     }
+}
+
+// A kind of clip that finds neither size nor ratio and doesn't say so.
+TEST(BaseClip, TellsAMissingSizeFromAMissingRatio) {
+    FakeHost host;
+    const RecordingLog log(host);
+    PlaceClip clip;
+    ncfUInt32 a = 7;
+    ncfUInt32 b = 7;
+    EXPECT_EQ(clip.BaseClip::GetEncodedWidthAndHeight(&a, &b), NCF_E_FAIL);
+    EXPECT_EQ(log.count("NCFASSERT( width_ && height_ )BaseClip::GetEncodedWidthAndHeight"), 1);
+    const std::size_t before = log.records().size();
+    EXPECT_EQ(clip.BaseClip::GetImageAspectRatio(&a, &b), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(log.records().size(), before + 1) << "no more than the ratio that was found";
+    EXPECT_EQ(log.records().back().text, "BaseClip::GetImageAspectRatioimage_aspect_ratio: 0/0");
+    EXPECT_EQ(a, 7u);
+    EXPECT_EQ(b, 7u);
 }

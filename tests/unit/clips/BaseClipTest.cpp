@@ -157,6 +157,20 @@ TEST_F(BaseClipSound, CutsSoundToThePicture) {
     EXPECT_TRUE(enough);
 }
 
+TEST_F(BaseClipSound, RoundsThePicturesFigure) {
+    Video().table->numSamples = 2;
+    Video().mediaTimescale = 30000;
+    Video().mediaDuration = 2002;
+    Video().trackDuration = 67;
+    Sound().description->rate = 44100.0;
+    Load();
+    clip->SetEditRate(EditorSettings());
+    clip->SetMovieLength(EditorSettings());
+    ncfUInt64 samples = 0;
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_OK);
+    EXPECT_EQ(samples, 2943u);  // 2942.94
+}
+
 TEST_F(BaseClipSound, KeepsShortSoundAsItIs) {
     Sound().trackDuration = 9000;
     ncfUInt64 samples = 0;

@@ -160,6 +160,21 @@ TEST_F(QuickTimeClipAttributeTexts, FallsBackOnATextThatIsNotThere) {
               1);
 }
 
+TEST_F(QuickTimeClipAttributeTexts, FallsBackWhenTheTextsThrow) {
+    struct Throwing : FakeVideoDescription {
+        using FakeVideoDescription::FakeVideoDescription;
+        NCFRESULT GetCMAttributes(INCFString**) override { throw std::bad_alloc(); }
+        NCFRESULT GetRIAttributes(INCFString**) override { throw std::bad_alloc(); }
+    };
+    Video().description->Release();
+    Video().description = new Throwing(&journal);
+    Load();
+    EXPECT_TRUE(clip->IsLoaded());
+    GeometryDetails details;
+    clip->GetGeometryDetails(&details);
+    ExpectDefaultGeometry(details);
+}
+
 TEST_F(QuickTimeClipAttributeTexts, SurvivesEveryCutOfTheTexts) {
     const std::string color = Descriptor("<Name>F</Name>" + std::string(kLabel));
     for (std::size_t length = 0; length < color.size(); ++length) {

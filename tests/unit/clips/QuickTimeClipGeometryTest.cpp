@@ -1,6 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include <limits>
+
 #include "tests/unit/clips/ClipFixture.h"
 
 namespace {
@@ -85,6 +87,7 @@ TEST_F(QuickTimeClipGeometry, KeepsFractionsThatDoNotDivide) {
 TEST_F(QuickTimeClipGeometry, TakesTheRatioByItsTwoNumbersOnly) {
     // 32/18 is the same ratio, but not the same numbers.
     ExpectSize(SourceOf(720, 576, 32, 18), {600, 1}, {10800, 32});
+    ExpectSize(SourceOf(720, 576, 8, 6), {600, 1}, {450, 1});
 }
 
 TEST_F(QuickTimeClipGeometry, SwapsWidthAndHeightOfRotatedMovies) {
@@ -127,6 +130,14 @@ TEST_F(QuickTimeClipGeometry, WrapsLargeNumbersAt32Bits) {
     const BoundsBox box = SourceOf(65535, 65535, 70001, 60001);
     ExpectSize(box, {327675, 6}, {-1814008805, 420006});
     EXPECT_EQ(box.positionY, (Rational{1814008805, 840012}));
+}
+
+TEST_F(QuickTimeClipGeometry, DoesNotDivideTheLeastNumberByMinusOne) {
+    // 1600 * 2^25 wraps to the least number there is; its opposite has no
+    // place.
+    const BoundsBox box = SourceOf(1920, 1080, 0xFFFFFFFFu, 1u << 25);
+    ExpectSize(box, {1600, 1}, {std::numeric_limits<ncfSInt32>::min(), -1});
+    EXPECT_EQ(box.positionY, (Rational{1 << 30, 1}));
 }
 
 TEST_F(QuickTimeClipGeometry, ChecksItsOutput) {

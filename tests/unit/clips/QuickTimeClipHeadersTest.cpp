@@ -227,6 +227,10 @@ TEST_F(QuickTimeClipLoading, ChecksItsThreeArgumentsInOrder) {
     EXPECT_EQ(log->count("CHK_PTR(componentFactory_)QuickTimeClip::LoadClipImpl"), 1);
     EXPECT_EQ(log->count("CHK_PTR(fileName_.inArg())QuickTimeClip::LoadClipImpl"), 1);
     EXPECT_EQ(nothing.LoadClipImpl(), NCF_E_POINTER);
+    EXPECT_EQ(nothing.SetFieldLayoutDetails(), NCF_E_POINTER);
+    EXPECT_EQ(log->count("CHK_PTR(console_)QuickTimeClip::SetFieldLayoutDetails"), 1);
+    EXPECT_EQ(noName.SetFieldLayoutDetails(), NCF_E_POINTER);
+    EXPECT_EQ(log->count("CHK_PTR(qtParser_)QuickTimeClip::SetFieldLayoutDetails"), 1);
 }
 
 TEST_F(QuickTimeClipLoading, DoesNothingWhenLoadedAlready) {
@@ -326,6 +330,37 @@ TEST_F(QuickTimeClipLoading, StopsAtEveryFailingStep) {
     }
 }
 
+TEST_F(QuickTimeClipLoading, StopsWhenWhatWorkedOnceFailsLater) {
+    parser->AddVideoTrack(1);
+    parser->passes["GetVideoTrackCount"] = 1;
+    parser->results["GetVideoTrackCount"] = NCF_E_ABORT;
+    Load();
+    EXPECT_FALSE(clip->IsLoaded());
+    EXPECT_EQ(log->count(ReturnRecord("80000007", "GetVideoTrackCount(&videoTrackCount)",
+                                      "QuickTimeClip::LoadClipImpl")),
+              1);
+    parser->results.clear();
+    Picture().passes["GetDataFormat"] = 1;
+    Picture().results["GetDataFormat"] = NCF_E_ABORT;
+    Load();
+    EXPECT_FALSE(clip->IsLoaded());
+    EXPECT_EQ(
+        log->count(ReturnRecord("80000007", "GetDataFormat(&fourCC)", "BaseClip::LoadClipBase")),
+        1);
+}
+
+TEST_F(QuickTimeClipLoading, StopsWhenTheSoundCannotBeCountedAgain) {
+    parser->AddAudioTrack(1);
+    parser->passes["GetAudioTrackCount"] = 1;
+    parser->results["GetAudioTrackCount"] = NCF_E_ABORT;
+    Load();
+    EXPECT_FALSE(clip->IsLoaded());
+    EXPECT_TRUE(host->console().lines().empty());
+    EXPECT_EQ(log->count(ReturnRecord("80000007", "GetAudioTrackCount(&audioTrackCount)",
+                                      "QuickTimeClip::LoadClipImpl")),
+              1);
+}
+
 TEST_F(QuickTimeClipLoading, StopsWhenThePictureCannotBeRead) {
     struct {
         const char* operation;
@@ -349,6 +384,11 @@ TEST_F(QuickTimeClipLoading, StopsWhenThePictureCannotBeRead) {
         Load();
         EXPECT_FALSE(clip->IsLoaded()) << step.operation;
         EXPECT_EQ(log->count(std::string("NCF_RETURN(0x8000ffff): ") + step.record), 1)
+            << step.operation;
+        const bool inBase = std::string(step.record).find("LoadClipImpl") == std::string::npos;
+        EXPECT_EQ(log->count(ReturnRecord("8000ffff", "BaseClip::LoadClipBase()",
+                                          "QuickTimeClip::LoadClipImpl")),
+                  inBase ? 1 : 0)
             << step.operation;
         Picture().results = results;
     }

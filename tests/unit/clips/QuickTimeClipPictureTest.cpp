@@ -93,6 +93,35 @@ TEST_F(QuickTimeClipPicture, RefusesAPictureWithoutSize) {
     EXPECT_EQ(clip->LoadClipImpl(), NCF_E_FAIL);
 }
 
+TEST_F(QuickTimeClipPicture, AsksAgainForASizeOfWhichHalfIsKnown) {
+    Picture().width = 0;
+    Load();
+    Picture().width = 640;
+    ncfUInt32 width = 0;
+    ncfUInt32 height = 0;
+    EXPECT_EQ(clip->GetEncodedWidthAndHeight(&width, &height), NCF_OK);
+    EXPECT_EQ(width, 640u);
+    EXPECT_EQ(height, 1080u);
+}
+
+TEST_F(QuickTimeClipPicture, ChecksTheOutputsOfItsProperties) {
+    Load();
+    EXPECT_EQ(clip->GetColorSpace(nullptr), NCF_E_POINTER);
+    EXPECT_EQ(clip->GetTemporalFieldOrder(nullptr), NCF_E_POINTER);
+    EXPECT_EQ(clip->GetFrameBufferLayout(nullptr), NCF_E_POINTER);
+    EXPECT_EQ(clip->GetBufferLineOrientation(nullptr), NCF_E_POINTER);
+}
+
+TEST_F(QuickTimeClipPicture, HandsAFailingFormatOn) {
+    Load();
+    Picture().results["GetDataFormat"] = NCF_E_ABORT;
+    ncfUInt32 code = 0;
+    EXPECT_EQ(clip->GetDataFormat(&code), NCF_E_ABORT);
+    EXPECT_EQ(log->count(ReturnRecord("80000007", "vdscr->GetDataFormat(dataFormat)",
+                                      "QuickTimeClip::GetDataFormat")),
+              1);
+}
+
 TEST_F(QuickTimeClipPicture, RefusesAPictureWithoutRatio) {
     Picture().aspectDenominator = 0;
     Load();

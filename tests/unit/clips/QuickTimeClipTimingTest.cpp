@@ -285,6 +285,14 @@ TEST_F(QuickTimeClipTiming, CountsTheSamplesOfASoundTrack) {
     track.mediaDuration = 44100;
     EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(2, &samples), NCF_OK);
     EXPECT_EQ(samples, 48000u);
+    track.mediaDuration = 1000;
+    EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(2, &samples), NCF_OK);
+    EXPECT_EQ(samples, 1088u);
+    track.mediaDuration = 1001;
+    EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(2, &samples), NCF_OK);
+    EXPECT_EQ(samples, 1090u);  // 1089.5
+    EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(99, &samples), NCF_E_NOTFOUND);
+    EXPECT_EQ(samples, 0u);
 }
 
 TEST_F(QuickTimeClipTiming, ReachesBeyondTheSignedRangeInSamples) {

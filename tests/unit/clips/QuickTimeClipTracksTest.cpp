@@ -238,6 +238,16 @@ TEST_F(QuickTimeClipTracks, ReadsTheOtherSoundValuesWhenOneFails) {
     EXPECT_TRUE(log->records().empty());
 }
 
+TEST_F(QuickTimeClipTracks, AsksForTheDescriptionEvenWhereNoneIsCounted) {
+    LoadMany();
+    parser->audioTracks[0]->descriptionCount = 0;
+    parser->audioTracks[0]->description->littleEndian = 2;  // any flag but 0
+    AudioTrackMetadata info;
+    EXPECT_EQ(clip->GetAudioTrackMetadata(8, &info), NCF_OK);
+    EXPECT_EQ(info.channelsPerFrame, 2u);
+    EXPECT_EQ(info.isBigEndian, 0);
+}
+
 TEST_F(QuickTimeClipTracks, RefusesSoundOfSeveralDescriptions) {
     LoadMany();
     parser->audioTracks[0]->descriptionCount = 2;
@@ -445,6 +455,25 @@ TEST_F(QuickTimeClipTracks, HandsTheTablesAnswerOnUnlogged) {
     ncfUInt64 wide = 5;
     EXPECT_EQ(clip->GetDataOffset(2, 0, &wide), NCF_E_INVALIDARG);
     EXPECT_EQ(wide, 5u);
+    auto& results = parser->audioTracks[1]->table->results;
+    for (const char* operation :
+         {"GetNumSamples", "GetSampleFlags", "GetNextDiscontiguousDataAttributeChange",
+          "GetDataSizePerSample", "GetDisplayOffset", "GetDecodeDuration", "GetMaxDataSizeInBytes",
+          "GetHasOutOfOrderFrameDependencies", "DisplayTimeToFrameNum"}) {
+        results[operation] = NCF_E_ABORT;
+    }
+    ncfUInt32 narrow = 0;
+    ncfSInt64 signedWide = 0;
+    ncfBool flag = 0;
+    EXPECT_EQ(clip->GetNumSamples(2, &wide), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetSampleFlags(2, 1, &narrow), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetNextDiscontiguousDataAttributeChange(2, 1, &wide), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetDataSizePerSample(2, 1, &narrow), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetDisplayOffset(2, 1, &signedWide), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetDecodeDuration(2, 1, &signedWide), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetMaxDataSizeInBytes(2, &narrow), NCF_E_ABORT);
+    EXPECT_EQ(clip->GetHasOutOfOrderFrameDependencies(2, &flag), NCF_E_ABORT);
+    EXPECT_EQ(clip->DisplayTimeToFrameNum(2, 1, &wide), NCF_E_ABORT);
     EXPECT_TRUE(log->records().empty());
     EXPECT_EQ(clip->GetDataOffset(99, 1, &wide), NCF_E_NOTFOUND);
     EXPECT_EQ(log->count(ReturnRecord("8000000c", "GetSampleTable(qtTrack, sampleTable.outArg())",

@@ -38,6 +38,11 @@ TEST(Rational, RoundsHalfAFrameASecondUp) {
     ExpectRate(0.5, 1000, 1001);
 }
 
+TEST(Rational, RoundsToThousandthsFirst) {
+    ExpectRate(0.4996, 1000, 1001);
+    ExpectRate(0.4994, 0, 1);
+}
+
 TEST(Rational, ReducesTheNtscForm) {
     ExpectRate(12.5, 1000, 77);
     ExpectRate(7.5, 8000, 1001);

@@ -271,6 +271,16 @@ TEST_P(SimpleFileIOSectors, SurvivesWithoutMemory) {
     EXPECT_EQ(seen, Part(0, 10));
 }
 
+TEST_P(SimpleFileIOSectors, SurvivesWhenItsBufferCannotGrow) {
+    ASSERT_EQ(Read(0, 10), NCF_OK);
+    system.outOfMemory = true;
+    EXPECT_EQ(Read(0, 2 * GetParam() + 1), NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(bytesRead, 0u);
+    system.outOfMemory = false;
+    EXPECT_EQ(Read(0, 10), NCF_OK);
+    EXPECT_EQ(seen, Part(0, 10));
+}
+
 TEST_P(SimpleFileIOSectors, AsksForTheSizeOnce) {
     ncfUInt64 size = 0;
     EXPECT_EQ(file->GetLength(&size), NCF_OK);
