@@ -46,6 +46,7 @@ struct Description {
     IAAFSmartPointer<IAAFSourceMob> pFileMob;
     IAAFSmartPointer<IAAFMob> pMobSourceMob;
     IAAFSmartPointer<IAAFSourceMob> pSourceMob;
+    bool showsAlpha = false;
     aafPosition_t absoluteStartTime = 0;
 
     NCFRESULT OpenFile();
@@ -105,6 +106,7 @@ NCFRESULT Description::SetRateAndLength() {
 NCFRESULT Description::IdentifyMobs() {
     std::vector<ncfUInt8> pContent;
     NCF_RETURN(media->GetContentForHash(pContent));
+    showsAlpha = media->ShowsAlpha();
 
     const ncfUInt8 nothing = 0;  // content of no bytes still has an address
     const ncfUInt8* const content = pContent.empty() ? &nothing : pContent.data();
@@ -167,7 +169,7 @@ NCFRESULT Description::AddMobs() {
 }
 
 NCFRESULT Description::FinishMasterMob() {
-    if (media->ShowsAlpha()) {
+    if (showsAlpha) {
         NCF_RETURN(AddMasterMobAppCode( pDictionary, pMasterMob, kPrecomputeMasterMob ));
     }
     NCF_RETURN(AddBinColMappingToMob( pMobMasterMob ));

@@ -3,6 +3,8 @@
 
 #include "source/aaf/NewAAFFromMovie.h"
 
+#include <map>
+
 #include "tests/unit/aaf/support/AAFTest.h"
 
 namespace NMA::Impl {
@@ -110,6 +112,27 @@ TEST_F(NewAAFFromMovieTest, AsksTheClipInOrder) {
     EXPECT_LT(at("clip GetAudioTrackCount"), static_cast<std::ptrdiff_t>(lines_.size()));
 }
 
+TEST_F(NewAAFFromMovieTest, AsksTheClipBetweenItsCallsToTheLibrary) {
+    std::map<std::string, std::string> lastCall;  // by question, when first asked
+    clip->whenAsked = [&](const std::string& operation) {
+        lastCall.emplace(operation, aaf.journal().lines().back());
+    };
+    clip->videoTracks = 0;
+    ASSERT_EQ(Describe(), NCF_OK);
+    EXPECT_EQ(lastCall.at("SetEditRate"), "SourceMob2.Initialize");
+    EXPECT_EQ(lastCall.at("SetMovieLength"), "SourceMob2.Initialize");
+    EXPECT_EQ(lastCall.at("GetContentForHash"), "SourceMob2.Initialize");
+    EXPECT_EQ(lastCall.at("GetEditRate").rfind("MultipleDescriptor1.QueryInterface", 0), 0u);
+}
+
+TEST_F(NewAAFFromMovieTest, ARefusedFileIsNoQuestionToTheEditor) {
+    journal.clear();
+    aaf.refuse("SourceMob2.Initialize");
+    EXPECT_LT(Describe(), 0);
+    EXPECT_EQ(journal.count("create editor settings"), 0);
+    EXPECT_EQ(journal.count("clip SetEditRate"), 0);
+}
+
 TEST_F(NewAAFFromMovieTest, HandsTheEditorsSettingsToTheClip) {
     editor.rate = 29.97;
     editor.named = 1;
@@ -169,6 +192,16 @@ TEST_F(NewAAFFromMovieTest, OnlyAlphaHasAnAppCode) {
               aaf.place("Header2.AddMob SourceMob4"));
 }
 
+TEST_F(NewAAFFromMovieTest, TheAppCodeFollowsTheAlphaThatWasThereWithTheContent) {
+    clip->whenAsked = [&](const std::string& operation) {
+        if (operation == "GetAudioTrackCount") {
+            clip->setAlpha(true, false);
+        }
+    };
+    ASSERT_EQ(Describe(), NCF_OK);
+    EXPECT_FALSE(aaf.journal().contains("AppCode"));
+}
+
 TEST_F(NewAAFFromMovieTest, ChecksItsArguments) {
     const std::tr1::shared_ptr<BaseClip> none;
     IAAFFile* out = nullptr;
@@ -182,6 +215,13 @@ TEST_F(NewAAFFromMovieTest, AnEmptyPathFailsBeforeTheFileIsOpened) {
     MakeFreshClip("");
     EXPECT_EQ(Describe(), NCF_E_INVALIDARG);
     EXPECT_EQ(aaf.callCount(), 0);
+}
+
+TEST_F(NewAAFFromMovieTest, AClipWithoutAPathObjectGetsAsFarAsItsName) {
+    clip->setFileName(nullptr);
+    EXPECT_LT(Describe(), 0);
+    EXPECT_GE(aaf.place("SourceMob2.Initialize"), 0);
+    EXPECT_EQ(aaf.place("Header1.AddMob"), -1);
 }
 
 TEST_F(NewAAFFromMovieTest, AClipWithoutAFactoryFailsWithItsPointerCode) {

@@ -3,6 +3,8 @@
 
 #include "source/aaf/Tracks.h"
 
+#include <algorithm>
+
 #include "source/aaf/MobIds.h"
 #include "tests/unit/aaf/support/AAFTest.h"
 
@@ -111,6 +113,50 @@ TEST_F(TracksTest, AVideoClipWithTimecodeAndTwoStereoTracks) {
     EXPECT_TRUE(aaf.has("Dictionary.LookupDataDef 6F3C8CE1-6CEF-11D2-807D-006008143E6F"));
     EXPECT_TRUE(aaf.has("Dictionary.LookupDataDef 78E1EBE1-6CEF-11D2-807D-006008143E6F"));
     EXPECT_EQ(start, 90000);
+}
+
+TEST_F(TracksTest, AsksForEachKindWhenTheOneBeforeStands) {
+    clip->timecode.resize(1);
+    clip->sound.resize(2);
+    clip->sound[1].qtTrack = 9;
+    std::vector<std::string> asked;  // with the last call to the library
+    clip->whenAsked = [&](const std::string& operation) {
+        for (const char* question :
+             {"GetEditRate", "GetMovieLength", "GetTimeCodeTrackCount", "GetTimecodeTrackQTId",
+              "GetTimeCodeTrackMetadata", "GetVideoTrackCount", "GetAudioTrackCount"}) {
+            if (operation == question) {
+                const auto& calls = aaf.journal().lines();
+                const std::string last = calls.empty() ? "" : calls.back();
+                // Descriptors ask for the rate again: only slots tell the place.
+                if (last.find("Descriptor") == std::string::npos) {
+                    asked.push_back(operation + " after " + last);
+                }
+            }
+        }
+    };
+    const IAAFSmartPointer<IAAFMasterMob> master = As<IAAFMasterMob>(masterMob);
+    const IAAFSmartPointer<IAAFSourceMob> file = As<IAAFSourceMob>(fileMob);
+    const IAAFSmartPointer<IAAFSourceMob> source = As<IAAFSourceMob>(sourceMob);
+    aaf.clearJournal();
+    ASSERT_EQ(AddTracksToAAF(Media(), Console(), header, Dictionary(), masterMob, master, fileMob,
+                             file, sourceMob, source, multi, host.factory(), &start),
+              NCF_OK);
+    EXPECT_EQ(asked,
+              (std::vector<std::string>{
+                  "GetEditRate after ", "GetMovieLength after ", "GetTimeCodeTrackCount after ",
+                  "GetTimecodeTrackQTId after ", "GetTimeCodeTrackMetadata after ",
+                  "GetVideoTrackCount after Source1Slot1.SetPhysicalNum 1",
+                  "GetAudioTrackCount after Source1Slot2.SetName ''"}));
+    // Each descriptor comes before its slots.
+    const std::vector<int> places = {
+        aaf.place("MultipleDescriptor1.AppendFileDescriptor CDCIDescriptor1"),
+        aaf.place("Master1.NewPhysSourceRef 25/1 2 "),
+        aaf.place("MultipleDescriptor1.AppendFileDescriptor PCMDescriptor1"),
+        aaf.place("Master1.NewPhysSourceRef 25/1 3 "),
+        aaf.place("MultipleDescriptor1.AppendFileDescriptor PCMDescriptor2"),
+        aaf.place("Master1.NewPhysSourceRef 25/1 5 ")};
+    EXPECT_TRUE(std::is_sorted(places.begin(), places.end()));
+    EXPECT_GT(places.front(), 0);
 }
 
 TEST_F(TracksTest, EverySlotsNameIsEmptyInAllMobs) {

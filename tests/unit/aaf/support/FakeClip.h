@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <functional>
 #include <map>
 #include <string>
 #include <vector>
@@ -60,6 +61,8 @@ public:
     std::vector<ncfUInt8> content = {1, 2, 3, 4};
     // Operation -> failure.
     std::map<std::string, NCFRESULT> failures;
+    // Hears each question before it is answered.
+    std::function<void(const std::string& operation)> whenAsked;
     // What SetEditRate was given.
     EditorSettings seenSettings;
 
@@ -237,6 +240,9 @@ private:
     NCFRESULT told(const std::string& operation) const {
         if (journal_) {
             journal_->add("clip " + operation);
+        }
+        if (whenAsked) {
+            whenAsked(operation);
         }
         return failure(operation);
     }
