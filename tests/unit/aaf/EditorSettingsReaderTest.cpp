@@ -84,8 +84,16 @@ TEST_F(EditorSettingsReaderTest, LeavesSixtyWhenTheSingleFrameDurationFails) {
 }
 
 TEST_F(EditorSettingsReaderTest, APositiveAnswerIsNoFullSuccess) {
-    editor.singleResult = 1;
-    EXPECT_EQ(Read()._areSettingsValid, 0u);
+    for (NCFRESULT EditorAnswers::*answer :
+         {&EditorAnswers::rateResult, &EditorAnswers::forcedResult, &EditorAnswers::singleResult}) {
+        editor = EditorAnswers();
+        editor.*answer = 1;
+        EXPECT_EQ(Read()._areSettingsValid, 0u);
+    }
+    editor = EditorAnswers();
+    editor.named = 1;
+    editor.namedResult = 1;
+    EXPECT_EQ(Read()._movieDurationCalculationToUse, 0u);
 }
 
 TEST_F(EditorSettingsReaderTest, OnlyTheValueOneChoosesTheMovieHeader) {

@@ -71,10 +71,14 @@ TEST_F(StartTimeTest, IsAddedToEverySourceClip) {
 }
 
 TEST_F(StartTimeTest, TheLoopEndsAtAnyOtherAnswerOfTheEnumerator) {
-    aaf.refuse("SlotEnumerator1.NextOne", AAFRESULT_INTERNAL_ERROR, 2);
-    EXPECT_EQ(AddStartTimeToSourceClip(mob, 1000), NCF_OK);
-    EXPECT_TRUE(aaf.has("SourceMob1Clip1.SetSourceReference {00 slot 4 at 1004}"));
-    EXPECT_EQ(aaf.place("SourceMob1Clip2.SetSourceReference"), -1);
+    int enumerator = 0;
+    for (const HRESULT answer : {AAFRESULT_INTERNAL_ERROR, HRESULT{1}}) {
+        aaf.clearJournal();
+        aaf.refuse("SlotEnumerator" + std::to_string(++enumerator) + ".NextOne", answer, 2);
+        EXPECT_EQ(AddStartTimeToSourceClip(mob, 1000), NCF_OK);
+        EXPECT_EQ(aaf.linesOf("SourceMob1Clip1.SetSourceReference").size(), 1u);
+        EXPECT_EQ(aaf.place("SourceMob1Clip2.SetSourceReference"), -1);
+    }
 }
 
 TEST_F(StartTimeTest, EveryOtherRefusalComesBackUnchanged) {

@@ -149,6 +149,13 @@ TEST_F(TimecodeTest, APositiveAnswerCountsAsFailureToo) {
     EXPECT_TRUE(lines.contains("Unable to set the timecode length, AAFResult = 0x1, "));
 }
 
+TEST_F(TimecodeTest, AThrownCodeIsReturnedAsItIs) {
+    aaf.throwsRefusals = true;
+    aaf.refuse("Sequence1.Initialize", AAFRESULT_NOMEMORY);
+    EXPECT_EQ(Add(0), AAFRESULT_NOMEMORY);
+    EXPECT_TRUE(lines.lines().empty());
+}
+
 TEST_F(TimecodeTest, AFailedLookUpIsAnUnknownException) {
     aaf.refuse("Dictionary.LookupDataDef");
     EXPECT_EQ(Add(0), NCF_E_UNEXPECTED);

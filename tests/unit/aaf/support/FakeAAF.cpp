@@ -117,6 +117,9 @@ HRESULT FakeAAF::note(const std::string& line) {
     for (Refusal& refusal : refusals_) {
         if (StartsWith(line, refusal.start) && --refusal.left == 0) {
             ++refused_;
+            if (throwsRefusals) {
+                throw static_cast<NCFRESULT>(refusal.result);
+            }
             return refusal.result;
         }
     }

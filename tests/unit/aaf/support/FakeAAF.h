@@ -60,6 +60,8 @@ public:
 
     // As the library does; a test may look past it.
     bool refusesNegativeLengths = true;
+    // Refusals come as exceptions that carry the code.
+    bool throwsRefusals = false;
 
     int liveObjects() const { return live_; }
     // What the module told the library when it opened the last file.
