@@ -69,9 +69,12 @@ ncfUInt32 ConstantPacketSize(const AVCodecParameters& parameters) {
     const auto channels = static_cast<ncfUInt32>(parameters.ch_layout.nb_channels);
     switch (parameters.codec_id) {
         case AV_CODEC_ID_PCM_ALAW:
-        case AV_CODEC_ID_PCM_MULAW: return channels;
-        case AV_CODEC_ID_ADPCM_IMA_QT: return kIma4Packet * channels;
-        default: break;
+        case AV_CODEC_ID_PCM_MULAW:
+            return channels;
+        case AV_CODEC_ID_ADPCM_IMA_QT:
+            return kIma4Packet * channels;
+        default:
+            break;
     }
     const bool constant = av_get_bits_per_sample(parameters.codec_id) > 0;
     return constant && parameters.block_align > 0 ? static_cast<ncfUInt32>(parameters.block_align)

@@ -7,8 +7,8 @@
 #include "reference_host/aaf/model/ClassDefinition.h"
 #include "reference_host/aaf/model/Enumerator.h"
 #include "reference_host/aaf/model/Model.h"
-#include "reference_host/aaf/model/Text.h"
 #include "reference_host/aaf/model/StoredNumbers.h"
+#include "reference_host/aaf/model/Text.h"
 #include "reference_host/aaf/model/TypeDefinition.h"
 
 namespace aaf {

@@ -133,7 +133,8 @@ HRESULT Object::GetProperties(IEnumAAFProperties** enumerator) {
             if (index >= self->values().size()) {
                 return nullptr;
             }
-            const auto entry = std::next(self->values().begin(), static_cast<std::ptrdiff_t>(index));
+            const auto entry =
+                std::next(self->values().begin(), static_cast<std::ptrdiff_t>(index));
             PropertyDefinition* property = self->class_->FindProperty(entry->first);
             return RefPtr<Unknown>(new Property(*self, *property, *entry->second));
         },
