@@ -76,7 +76,7 @@ void* FindSymbol(void* library, const char* name);
 // A mutex that processes share by name; null when it can't be made.
 void* CreateNamedMutex(const char* name);
 // Outcomes of waiting for one; an abandoned one was left by a dead owner.
-enum class Wait { kAcquired, kAbandoned, kTimeout, kFailed };
+enum class Wait { kAcquired, kAbandoned, kTimeout, kFailed, kUndefined };
 Wait WaitForMutex(void* mutex);
 bool ReleaseMutex(void* mutex);
 void CloseMutex(void* mutex);

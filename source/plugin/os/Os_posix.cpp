@@ -7,6 +7,7 @@
 #include <dlfcn.h>
 #include <fcntl.h>
 #include <pthread.h>
+#include <sys/file.h>
 #include <sys/mman.h>
 #include <sys/stat.h>
 #include <sys/statvfs.h>
@@ -92,8 +93,9 @@ FileHandle OpenForReading(const std::u16string& path) {
         return kNoFile;
     }
     struct stat status {};
-    if (fstat(descriptor, &status) != 0 || !S_ISREG(status.st_mode)) {
-        Fail(S_ISDIR(status.st_mode) ? EISDIR : EINVAL);
+    const bool known = fstat(descriptor, &status) == 0;
+    if (!known || !S_ISREG(status.st_mode)) {
+        Fail(!known ? errno : S_ISDIR(status.st_mode) ? EISDIR : EINVAL);
         close(descriptor);
         return kNoFile;
     }
@@ -258,7 +260,8 @@ void* CreateNamedMutex(const char* name) {
     }
     void* memory = MAP_FAILED;
     // Whoever locks the file first makes the mutex; the others find it made.
-    if (lockf(descriptor, F_LOCK, 0) == 0 && ftruncate(descriptor, sizeof(SharedMutex)) == 0) {
+    // This lock keeps threads of one process apart too.
+    if (flock(descriptor, LOCK_EX) == 0 && ftruncate(descriptor, sizeof(SharedMutex)) == 0) {
         memory =
             mmap(nullptr, sizeof(SharedMutex), PROT_READ | PROT_WRITE, MAP_SHARED, descriptor, 0);
     }
@@ -278,7 +281,9 @@ void* CreateNamedMutex(const char* name) {
         pthread_mutexattr_destroy(&attributes);
         shared->ready = 1;
     }
-    close(descriptor);  // gives the file lock back too
+    // By hand, since the mapping would keep the lock beyond the close.
+    flock(descriptor, LOCK_UN);
+    close(descriptor);
     return shared;
 }
 

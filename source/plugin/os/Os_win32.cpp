@@ -127,8 +127,10 @@ Wait WaitForMutex(void* mutex) {
             return Wait::kAbandoned;
         case WAIT_TIMEOUT:
             return Wait::kTimeout;
-        default:
+        case WAIT_FAILED:
             return Wait::kFailed;
+        default:
+            return Wait::kUndefined;
     }
 }
 

@@ -9,6 +9,7 @@
 #include <unistd.h>
 
 #include <atomic>
+#include <chrono>
 #include <string>
 #include <thread>
 
@@ -33,16 +34,23 @@ TEST_F(NamedMutex, IsTakenAgainByItsOwnerAtOnce) {
 TEST_F(NamedMutex, KeepsOtherThreadsOut) {
     SharedNamedMutex mutex(name.c_str());
     SharedNamedMutex other(name.c_str());
-    std::atomic<int> value{0};
+    std::atomic<bool> arrived{false};
+    std::atomic<bool> entered{false};
     mutex.Lock();
     std::thread waiting([&] {
+        arrived = true;
         other.Lock();
-        EXPECT_EQ(value, 1);
+        entered = true;
         other.Unlock();
     });
-    value = 1;
+    while (!arrived) {
+        std::this_thread::yield();
+    }
+    std::this_thread::sleep_for(std::chrono::milliseconds(50));
+    EXPECT_FALSE(entered);
     mutex.Unlock();
     waiting.join();
+    EXPECT_TRUE(entered);
 }
 
 TEST_F(NamedMutex, IsGivenBackByItsDestructor) {
