@@ -16,8 +16,8 @@
 // private unknown. It is never counted, so no cycle arises.
 class CNCFUnknown {
 public:
-    // Second-phase construction: takes the services that the object needs.
     virtual ~CNCFUnknown();
+    // Second-phase construction: takes the services that the object needs.
     virtual NCFRESULT InitializeInstance(INCFUnknown* host);
     // Runs once when the count reaches zero, just before deletion.
     virtual void FinalRelease();

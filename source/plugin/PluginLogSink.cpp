@@ -11,6 +11,18 @@ slog::CLoggerBaseEx* MakeDiscardingLogger() {
     return new slog::CNullLoggerEx;
 }
 
+// Holds the host's lock for a scope.
+class Locked {
+public:
+    explicit Locked(INCFLock& lock) : lock_(lock) { lock_.Lock(); }
+    ~Locked() { lock_.Unlock(); }
+    Locked(const Locked&) = delete;
+    Locked& operator=(const Locked&) = delete;
+
+private:
+    INCFLock& lock_;
+};
+
 }  // namespace
 
 PluginLogSink& PluginLogSink::Instance() {
@@ -25,6 +37,9 @@ void PluginLogSink::Start(INCFComponentFactory* factory) {
         return;
     }
     ThrowIfFailed(ncfCreate(factory, CompID_LockComponent, IID_LockComponent, lock_));
+    if (lock_.isNull()) {
+        ThrowIfFailed(NCF_E_POINTER);
+    }
     started_.store(true, std::memory_order_relaxed);
 }
 
@@ -39,14 +54,13 @@ slog::CLoggerBaseEx& PluginLogSink::Begin(ncfUInt64 mask, const char* where, ncf
         current_.store(&discard_, std::memory_order_relaxed);
         return discard_;
     }
-    lock_->Lock();
+    const Locked locked(*lock_.inArg());
     if (!logger_) {
         logger_.reset(maker_());
     }
     slog::CLoggerBaseEx& chosen = *logger_;
     current_.store(&chosen, std::memory_order_relaxed);
     chosen.BeginRecord(kind, where);
-    lock_->Unlock();
     return chosen;
 }
 

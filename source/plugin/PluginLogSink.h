@@ -19,8 +19,8 @@ public:
 
     static PluginLogSink& Instance();
 
-    // Takes the host's lock. Throws the factory's failure. A second start
-    // does nothing.
+    // Takes the host's lock. Throws the factory's failure, and NCF_E_POINTER for
+    // a lock that isn't there. A second start does nothing.
     void Start(INCFComponentFactory* factory);
     void Stop();
 

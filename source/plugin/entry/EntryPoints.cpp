@@ -45,10 +45,10 @@ constexpr NumberAttribute kComponentAttributes[] = {
     {ncfGuid("19D46FB3-CA72-43FC-9A38-445A7FAFD3FF"), kNCFValueTypeFourBytes, 1},
 };
 
-template <class Definition>
-void SetNumber(Definition& definition, const NumberAttribute& attribute) {
-    ThrowIfFailed(definition.SetAttribute(attribute.id, attribute.valueType, &attribute.value,
-                                          sizeof attribute.value));
+template <class Pointer>
+void SetNumber(const Pointer& definition, const NumberAttribute& attribute) {
+    ThrowIfFailed(definition->SetAttribute(attribute.id, attribute.valueType, &attribute.value,
+                                           sizeof attribute.value));
 }
 
 // Runs a body that may throw and turns what it throws into a result.
@@ -92,8 +92,8 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterPlugin(INCFUnknown* host,
                                          kComponentCount, 1));
         ThrowIfFailed(definition->SetAttribute(kDescriptionAttribute, kNCFValueTypeText,
                                                kDescription, 0xFFFFFFFFu));
-        SetNumber(*definition.inArg(), kAttributeA);
-        SetNumber(*definition.inArg(), kAttributeB);
+        SetNumber(definition, kAttributeA);
+        SetNumber(definition, kAttributeB);
         *outDefinition = definition.detach();
     });
 }
@@ -114,14 +114,14 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterComponent(INCFUnknown* host, ncfUInt32 in
         ThrowIfFailed(ncfCreate(factory.inArg(), CompID_ComponentDefinition,
                                 IID_INCFComponentDefinition, definition));
         for (const NumberAttribute& attribute : kComponentAttributes) {
-            SetNumber(*definition.inArg(), attribute);
+            SetNumber(definition, attribute);
         }
         const ComponentRow& row = kComponents[index];
         ThrowIfFailed(definition->Define(row.componentId, kComponentType, row.major, row.minor,
                                          row.classId, row.displayName));
         *outDefinition = definition.detach();
-        SetNumber(**outDefinition, kAttributeA);
-        SetNumber(**outDefinition, kAttributeB);
+        SetNumber(*outDefinition, kAttributeA);
+        SetNumber(*outDefinition, kAttributeB);
     });
     if (result < 0 && *outDefinition) {
         (*outDefinition)->Release();

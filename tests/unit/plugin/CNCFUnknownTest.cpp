@@ -205,6 +205,17 @@ TEST_F(Component, KeepsTheOrderOfItsVirtualOperations) {
     EXPECT_EQ(reinterpret_cast<Count>(table[6])(base), 1u);
     EXPECT_EQ(reinterpret_cast<Count>(table[6])(base), 2u);
     EXPECT_EQ(reinterpret_cast<Count>(table[7])(base), 1u);
+
+    using Query = NCFRESULT (*)(CNCFUnknown*, const GUID*, void**);
+    void* found = nullptr;
+    EXPECT_EQ(reinterpret_cast<Query>(table[5])(base, &IID_First, &found), NCF_OK);
+    EXPECT_EQ(found, static_cast<IFirst*>(&object));
+    EXPECT_EQ(static_cast<IFirst*>(found)->Release(), 1u);
+
+    journal.clear();
+    CNCFUnknown* const other = new (std::nothrow) TestComponent(nullptr);
+    reinterpret_cast<Plain>(table[4])(other);
+    EXPECT_EQ(journal.lines(), (std::vector<std::string>{"made", "destroyed"}));
 }
 
 }  // namespace

@@ -13,6 +13,7 @@
 #include "source/plugin/CreationFunctions.h"
 #include "source/plugin/PluginFolder.h"
 #include "source/plugin/PluginLogSink.h"
+#include "source/plugin/PluginLogger.h"
 #include "source/plugin/entry/ComponentTable.h"
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/support/fakes/RecordingLogger.h"
@@ -205,6 +206,24 @@ TEST_F(EntryPoints, RegisterPluginGivesTheRefusalOfEachServiceAndANullOutput) {
     }
 }
 
+TEST_F(EntryPoints, RegisterPluginAsksForTheMarkOfAHostFirst) {
+    host.refuseQuery(IID_INCFComponentFactory, NCF_E_ACCESSDENIED);
+    host.refuseQuery(IID_INCFHostUnknown, NCF_E_HANDLE);
+    INCFPluginDefinition* definition = nullptr;
+    EXPECT_EQ(NCFRegisterPlugin(host.unknown(), &definition), NCF_E_HANDLE);
+    EXPECT_EQ(host.creations(CompID_PluginDefinition), 0);
+}
+
+TEST_F(EntryPoints, RegisterNothingWithoutADefinitionObject) {
+    const auto nothing = [](const GUID&, void**) { return NCF_OK; };
+    host.maker(CompID_PluginDefinition, nothing);
+    host.maker(CompID_ComponentDefinition, nothing);
+    INCFPluginDefinition* plugin = nullptr;
+    INCFComponentDefinition* component = nullptr;
+    EXPECT_EQ(NCFRegisterPlugin(host.unknown(), &plugin), NCF_E_POINTER);
+    EXPECT_EQ(NCFRegisterComponent(host.unknown(), 0, &component), NCF_E_POINTER);
+}
+
 // --- the components' definitions -----------------------------------------------
 
 struct ExpectedComponent {
@@ -302,6 +321,13 @@ TEST_F(EntryPoints, TurnAnythingElseThatIsThrownIntoUnexpected) {
     INCFPluginDefinition* definition = nullptr;
     EXPECT_EQ(NCFRegisterPlugin(host.unknown(), &definition), NCF_E_UNEXPECTED);
     EXPECT_EQ(definition, nullptr);
+    host.maker(CompID_ComponentDefinition,
+               [](const GUID&, void**) -> NCFRESULT { throw "no result"; });
+    INCFComponentDefinition* component = nullptr;
+    EXPECT_EQ(NCFRegisterComponent(host.unknown(), 0, &component), NCF_E_UNEXPECTED);
+    EXPECT_EQ(component, nullptr);
+    host.maker(CompID_LockComponent, [](const GUID&, void**) -> NCFRESULT { throw "no result"; });
+    EXPECT_EQ(NCFStartup(host.unknown()), NCF_E_UNEXPECTED);
 }
 
 // --- class factories -------------------------------------------------------------
@@ -411,6 +437,26 @@ TEST_F(EntryPoints, StartupGivesTheRefusalOfTheFactoryOrTheLock) {
     host.refuseCreation(CompID_LockComponent, NCF_E_ACCESSDENIED);
     EXPECT_EQ(NCFStartup(host.unknown()), NCF_E_ACCESSDENIED);
     EXPECT_EQ(GetPluginFolder(), nullptr);
+}
+
+TEST_F(EntryPoints, StartupNeedsAHost) {
+    EXPECT_EQ(NCFStartup(nullptr), NCF_E_POINTER);
+}
+
+// The lock comes after the utility library and the logger's name, and before
+// the version line; what was begun ends with the shutdown alone.
+TEST_F(EntryPoints, FailedStartupKeepsHowFarItCameUntilShutdown) {
+    RecordingNMALog log;
+    NCFShutdown(nullptr);
+    PluginLogger().SetName("");
+    host.refuseCreation(CompID_LockComponent, NCF_E_ACCESSDENIED);
+    ASSERT_EQ(NCFStartup(host.unknown()), NCF_E_ACCESSDENIED);
+    EXPECT_GT(host.references(), 1u) << "the utility library holds the factory";
+    ASSERT_EQ(log.lines().size(), 1u) << "the shutdown's line, no version";
+    PluginLogger().Write(1, "%s", "hello");
+    EXPECT_EQ(log.lines().back().name, "QuickTime Plug-In");
+    EXPECT_EQ(NCFShutdown(host.unknown()), NCF_OK);
+    EXPECT_EQ(host.references(), 1u);
 }
 
 TEST_F(EntryPoints, SecondStartupStoresTheFolderAgainAndKeepsTheSink) {

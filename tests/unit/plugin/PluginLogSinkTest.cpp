@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <new>
+
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/support/fakes/RecordingLogger.h"
 
@@ -112,6 +114,26 @@ TEST_F(Sink, ThrowsTheRefusalOfItsLockAndStaysStopped) {
     }
     sink.Begin(1, "Somewhere", slog::kError);
     EXPECT_EQ(loggersMade, 0);
+}
+
+TEST_F(Sink, ThrowsWhenItsLockIsNotThereAndStaysStopped) {
+    host.maker(CompID_LockComponent, [](const GUID&, void**) { return NCF_OK; });
+    try {
+        sink.Start(host.factory());
+        FAIL() << "nothing was thrown";
+    } catch (NCFRESULT thrown) {
+        EXPECT_EQ(thrown, NCF_E_POINTER);
+    }
+    sink.Begin(1, "Somewhere", slog::kError);
+    EXPECT_EQ(loggersMade, 0);
+}
+
+TEST_F(Sink, GivesItsLockBackWhenNoMainLoggerCanBeMade) {
+    sink.SetLoggerMaker([]() -> slog::CLoggerBaseEx* { throw std::bad_alloc(); });
+    sink.Start(host.factory());
+    journal.clear();
+    EXPECT_THROW(sink.Begin(1, "Somewhere", slog::kError), std::bad_alloc);
+    EXPECT_EQ(journal.lines(), (std::vector<std::string>{"lock", "unlock"}));
 }
 
 TEST_F(Sink, DiscardsAfterItWasStopped) {
