@@ -23,16 +23,11 @@ constexpr ncfUInt32 kCapabilities = 16387;
 constexpr ncfUInt32 kPreferredAccess = 512;
 constexpr ncfUInt32 kOtherAccess = 256;
 
-NCFRESULT NewString(const ncfUTF16LiteralToUTF16& text, INCFString** out) {
-    if (!out) {
-        return NCF_OK;
-    }
-    *out = nullptr;
+NCFSmartPtr<INCFString> NewString(const ncfUTF16LiteralToUTF16& text) {
     NCFSmartPtr<INCFString> string;
     ThrowIfFailed(NMAString::CreateString(string.outArg()));
     ThrowIfFailed(string->AssignUTF16(kNCFUTF16, text.GetUTF16(), kNCFZeroTerminated));
-    *out = string.detach();
-    return NCF_OK;
+    return string;
 }
 
 }  // namespace
@@ -156,23 +151,47 @@ NCFRESULT QuickTimeContainer::GetFileType(ncfUInt32 index, INCFString** extensio
         return NCF_E_NOTFOUND;
     }
     return InterfaceEntry([&] {
+        struct Column {
+            INCFString** out;
+            const ncfUTF16LiteralToUTF16& text;
+            NCFSmartPtr<INCFString> made;
+        };
         const FileType& row = FileTypeAt(index);
-        NewString(row.extension, extension);
-        NewString(row.description, description);
-        NewString(FileTypeGroup(), group);
+        Column columns[] = {{extension, row.extension, {}},
+                            {description, row.description, {}},
+                            {group, FileTypeGroup(), {}}};
+        for (Column& column : columns) {
+            if (column.out) {
+                *column.out = nullptr;
+            }
+        }
+        // All strings are made before one is handed out, so that a failure
+        // leaves the caller with none.
+        for (Column& column : columns) {
+            if (column.out) {
+                column.made = NewString(column.text);
+            }
+        }
+        for (Column& column : columns) {
+            if (column.out) {
+                *column.out = column.made.detach();
+            }
+        }
         return NCF_OK;
     });
 }
 
 NCFRESULT QuickTimeContainer::GetMetadata(ncfSInt32 index, IAAFFile** ppData) {
     return InterfaceEntry([&]() -> NCFRESULT {
+        if (ppData) {
+            *ppData = nullptr;
+        }
         if (index != 0) {
             return NCF_E_NOTFOUND;
         }
         if (!ppData) {
             return NCF_OK;
         }
-        *ppData = nullptr;
         if (!aafFile_) {
             return NMA_E_NOTINITIALIZED;
         }

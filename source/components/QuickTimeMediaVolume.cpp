@@ -13,6 +13,17 @@
 #include "source/plugin/CreationFunctions.h"
 
 namespace NMA::Impl {
+namespace {
+
+// A path that the host has to give.
+INCFString* Needed(INCFString* path) {
+    if (!path) {
+        ThrowIfFailed(NCF_E_POINTER);
+    }
+    return path;
+}
+
+}  // namespace
 
 NCFRESULT CreateQuickTimeMediaVolume(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
                                      void** out) {
@@ -53,7 +64,7 @@ NCFRESULT QuickTimeMediaVolume::GetVolumeInfo(INCFString* path, IVolumeInfo** in
     return InterfaceEntry([&] {
         CreateOwnComponent<QuickTimeVolumeInfo>(componentFactory_.inArg(),
                                                 CompID_QuickTimeVolumeInfo, IID_IVolumeInfo, info)
-            .SetVolumePath(path);
+            .SetVolumePath(Needed(path));
         return NCF_OK;
     });
 }
@@ -65,7 +76,7 @@ NCFRESULT QuickTimeMediaVolume::GetMediaFormat(INCFString* path, IMediaFormat** 
     return InterfaceEntry([&] {
         CreateOwnComponent<QuickTimeMediaFormat>(
             componentFactory_.inArg(), CompID_QuickTimeMediaFormat, IID_IMediaFormat, format)
-            .SetVolumePath(path);
+            .SetVolumePath(Needed(path));
         return NCF_OK;
     });
 }

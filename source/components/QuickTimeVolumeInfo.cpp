@@ -39,6 +39,7 @@ NCFRESULT QuickTimeVolumeInfo::GetLabel(INCFString** label) {
         return NCF_E_INVALIDARG;
     }
     return InterfaceEntry([&] {
+        *label = nullptr;
         *label = NMAVolume(volumePath_.InArg()).GetVolumeLabel();
         return NCF_OK;
     });
@@ -96,6 +97,9 @@ NCFRESULT QuickTimeVolumeInfo::GetVolumeName(INCFString** name) {
         }
         *name = nullptr;
         std::u16string path = volumePath_.GetUTF16String();
+        if (path.empty()) {
+            return NMA_E_NOTINITIALIZED;
+        }
         if (path.back() == u'\\') {
             path.pop_back();
         }

@@ -23,7 +23,7 @@ private:
     ncfUInt32 value_;
 };
 
-// A container over a sound movie: no data files are needed to describe it.
+// A container that the host's own header parser serves.
 class Container : public ComponentFixture {
 protected:
     Container() {
@@ -126,6 +126,20 @@ TEST_F(Container, ListsItsFileTypes) {
     EXPECT_EQ(object->GetFileType(34, nullptr, nullptr, nullptr), NCF_E_NOTFOUND);
 }
 
+TEST_F(Container, HandsOutAllTextsOfAFileTypeOrNone) {
+    for (int nth = 1; nth <= 3; ++nth) {
+        const auto object = container();
+        host.refuseCreation(NCFCompID_NCFString, NCF_E_OUTOFMEMORY, nth);
+        auto* const poison = reinterpret_cast<INCFString*>(&host);
+        INCFString* texts[] = {poison, poison, poison};
+        EXPECT_EQ(object->GetFileType(0, &texts[0], &texts[1], &texts[2]), NCF_E_OUTOFMEMORY);
+        for (INCFString* const text : texts) {
+            EXPECT_EQ(text, nullptr) << nth;
+        }
+        host.clearRefusals();
+    }
+}
+
 // --- path ---------------------------------------------------------------------------
 
 TEST_F(Container, TakesAPathOnceAndLeavesTheCallersStringAlone) {
@@ -156,6 +170,81 @@ TEST_F(Container, PathWithAPercentSignIsNoFormat) {
     EXPECT_TRUE(log.contains("Container File Path = %s%n.mov"));
 }
 
+TEST_F(Container, RecordsItsPath) {
+    RecordingLog log(host);
+    container()->SetFilePath(text("C:/a.mov").inArg());
+    EXPECT_EQ(log.count("NMA::Impl::QuickTimeContainer::SetFilePathC:\\a.mov"), 1);
+}
+
+// A string that answers a copy, or refuses it.
+class CopyingString : public FakeObject<INCFString> {
+public:
+    CopyingString(INCFString* copy, NCFRESULT answer) : copy_(copy), answer_(answer) {}
+
+    ncfUInt32 GetEncoding() override { return kNCFUTF8; }
+    ncfUInt32 GetLength() override { return 0; }
+    ncfBool IsEmpty() override { return 0; }
+    NCFRESULT Assign(INCFString*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT AssignUTF8(ncfUInt32, const ncfUTF8*, ncfUInt32) override { return NCF_E_NOTIMPL; }
+    NCFRESULT AssignUTF16(ncfUInt32, const ncfUTF16*, ncfUInt32) override { return NCF_E_NOTIMPL; }
+    NCFRESULT AssignWCHAR(ncfUInt32, const ncfWCHAR*, ncfUInt32) override { return NCF_E_NOTIMPL; }
+    NCFRESULT ConvertTo(ncfUInt32) override { return answer_; }
+    NCFRESULT ConvertCopy(ncfUInt32 encoding, INCFString** out) override {
+        asked = encoding;
+        *out = copy_;
+        return copy_ ? NCF_OK : answer_;
+    }
+    NCFRESULT GetRawUTF8(ncfUTF8**) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetRawUTF16(ncfUTF16**) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetRawUTF32(ncfUTF32** out) override {
+        *out = nothing_;
+        return NCF_OK;
+    }
+    NCFRESULT GetRawWCHAR(ncfWCHAR** out) override {
+        *out = nullptr;
+        return NCF_E_ABORT;
+    }
+    NCFRESULT FindCharacter(ncfUTF32, ncfSInt32, ncfBool, ncfSInt32* at) override {
+        *at = -1;
+        return NCF_OK;
+    }
+    NCFRESULT FindWCHAR(const ncfWCHAR*, ncfUInt32, ncfUInt32, ncfSInt32*) override {
+        return NCF_E_NOTIMPL;
+    }
+
+    ncfUInt32 asked = 0;
+
+private:
+    INCFString* copy_;
+    NCFRESULT answer_;
+    ncfUTF32 nothing_[1] = {};
+};
+
+TEST_F(Container, StaysWithoutAPathThatCanNotBeCopied) {
+    const auto object = container();
+    NCFSmartPtr<INCFString> given;
+    auto* const string = new CopyingString(nullptr, NCF_E_HANDLE);
+    given.attach(string);
+    EXPECT_EQ(object->SetFilePath(given.inArg()), NCF_E_HANDLE);
+    EXPECT_EQ(string->asked, 4u) << "wide characters";
+    EXPECT_EQ(object->SetFilePath(text("a.mov").inArg()), NCF_OK);
+}
+
+TEST_F(Container, RecordsAPathThatCanNotBeTurnedOrRead) {
+    const auto failing = [&](NCFRESULT answer) {
+        NCFSmartPtr<INCFString> given;
+        given.attach(new CopyingString(new CopyingString(nullptr, answer), NCF_OK));
+        return container()->SetFilePath(given.inArg());
+    };
+    const std::string function = " : NMA::Impl::QuickTimeContainer::SetFilePath";
+    RecordingLog log(host);
+    EXPECT_EQ(failing(NCF_E_OUTOFMEMORY), NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(log.count("NCF_RETURN(0x80000002): ConvertSlashesInPlace(filePath_)" + function), 1);
+    EXPECT_EQ(failing(NCF_OK), NCF_E_ABORT);
+    EXPECT_EQ(log.count("NCF_RETURN(0x80000007): filePath_->GetRawWCHAR(&ppwcharStr)" + function),
+              1);
+}
+
 // --- description -----------------------------------------------------------------------
 
 TEST_F(Container, NeedsAPathBeforeItIsDescribed) {
@@ -174,7 +263,10 @@ TEST_F(Container, HasNoDescriptionUntilItIsAskedFor) {
     EXPECT_EQ(clips->GetMetadata(0, &file), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(file, nullptr);
     EXPECT_EQ(clips->GetMetadata(0, nullptr), NCF_OK);
+    file = reinterpret_cast<IAAFFile*>(&host);
     EXPECT_EQ(clips->GetMetadata(1, &file), NCF_E_NOTFOUND);
+    EXPECT_EQ(file, nullptr);
+    EXPECT_EQ(clips->GetMetadata(1, nullptr), NCF_E_NOTFOUND) << "the index is looked at first";
     EXPECT_EQ(clips->GetMetadata(-1, &file), NCF_E_NOTFOUND);
 }
 

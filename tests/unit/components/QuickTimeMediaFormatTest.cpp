@@ -5,10 +5,18 @@
 
 #include <algorithm>
 
+#include "reference_host/header_parser/QTParser.h"
 #include "source/components/QuickTimeSequences.h"
 #include "tests/unit/components/ComponentFixture.h"
 
 namespace {
+
+// A list of another make.
+struct ForeignClips : FakeObject<NMA::IAAFClips> {
+    ncfSInt32 GetCount() override { return 0; }
+    NCFRESULT GetMetadata(ncfSInt32, IAAFFile**) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetClipPath(ncfSInt32, INCFString*) override { return NCF_E_NOTIMPL; }
+};
 
 class MediaFormat : public ComponentFixture {
 protected:
@@ -75,6 +83,20 @@ TEST_F(MediaFormat, GivesTheRefusalOfTheFactory) {
     EXPECT_TRUE(clips.isNull());
 }
 
+TEST_F(MediaFormat, ListOfAnotherMakeIsUnexpectedAndLeftToTheCaller) {
+    host.maker(NMA::CompID_QuickTimeMasterClips, [](const GUID&, void** out) {
+        *out = static_cast<NMA::IAAFClips*>(new ForeignClips);
+        return NCF_OK;
+    });
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    EXPECT_EQ(formatFor(folder)->GetAAFClips(clips.outArg()), NCF_E_UNEXPECTED);
+    EXPECT_FALSE(clips.isNull());
+}
+
+TEST_F(MediaFormat, NeedsAnOutput) {
+    EXPECT_EQ(formatFor(folder)->GetAAFClips(nullptr), NCF_E_POINTER);
+}
+
 TEST_F(MediaFormat, NeedsAHost) {
     void* out = nullptr;
     EXPECT_EQ(NMA::Impl::CreateQuickTimeMediaFormat(nullptr, nullptr, NMA::IID_IMediaFormat, &out),
@@ -122,12 +144,13 @@ TEST_F(MasterClips, GivesTheFailureOfALoadAndLeavesTheOutput) {
 }
 
 TEST_F(MasterClips, GivesTheCodeOfAFileThatIsGone) {
-    host.maker(NCFCompID_QTParser, [](const GUID&, void**) { return NCF_OK; });
+    host.maker(NCFCompID_QTParser, [](const GUID& iid, void** out) {
+        return host::MakeRef<header_parser::QTParser>()->QueryInterface(iid, out);
+    });
     const auto clips = list();
     std::filesystem::remove(folder / "a.mov");
     IAAFFile* file = nullptr;
-    const NCFRESULT result = clips->GetMetadata(0, &file);
-    EXPECT_TRUE(result == NCF_E_HANDLE || result == NMA_E_NOTINITIALIZED) << result;
+    EXPECT_EQ(clips->GetMetadata(0, &file), NCF_E_HANDLE);
 }
 
 TEST_F(MasterClips, NeedsAHostWithAConsole) {

@@ -35,11 +35,11 @@ TEST_F(MediaVolume, DoesNotClaimWhatIsAbsent) {
     EXPECT_EQ(volume->IsMediaVolume(nullptr), 0);
 }
 
-TEST_F(MediaVolume, AnswersNoWhenAnythingIsThrown) {
+TEST_F(MediaVolume, DoesNotClaimWhatItCanNotList) {
     write("a.mov");
     // Without strings the scan has nothing to give its names in.
     host.refuseCreation(NCFCompID_NCFString, NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(volume->IsMediaVolume(path(folder).inArg()) & ~1, 0);
+    EXPECT_EQ(volume->IsMediaVolume(path(folder).inArg()), 0);
 }
 
 TEST_F(MediaVolume, MakesTheInformationOfAFolder) {
@@ -68,6 +68,18 @@ TEST_F(MediaVolume, NeedsItsOutputs) {
     EXPECT_EQ(volume->GetVolumeInfo(path(folder).inArg(), nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(volume->GetMediaFormat(path(folder).inArg(), nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(volume->GetContainerComponentId(nullptr), NCF_E_INVALIDARG);
+}
+
+TEST_F(MediaVolume, NeedsAPathForWhatItMakes) {
+    NCFSmartPtr<NMA::IVolumeInfo> info;
+    NCFSmartPtr<NMA::IMediaFormat> format;
+    EXPECT_EQ(volume->GetVolumeInfo(nullptr, info.outArg()), NCF_E_POINTER);
+    EXPECT_EQ(volume->GetMediaFormat(nullptr, format.outArg()), NCF_E_POINTER);
+}
+
+TEST_F(MediaVolume, AnswersItsOwnInterfaceAlone) {
+    NCFSmartPtr<NMA::IMediaFormat> format;
+    EXPECT_EQ(ncfQuery(volume.inArg(), format), NCF_E_NOINTERFACE);
 }
 
 TEST_F(MediaVolume, GivesTheRefusalOfTheFactory) {
@@ -100,6 +112,16 @@ TEST_F(MediaVolume, ForeignInformationIsUnexpected) {
     });
     NCFSmartPtr<NMA::IVolumeInfo> info;
     EXPECT_EQ(volume->GetVolumeInfo(path(folder).inArg(), info.outArg()), NCF_E_UNEXPECTED);
+}
+
+TEST_F(MediaVolume, NothingMadeIsUnexpected) {
+    const auto nothing = [](const GUID&, void**) { return NCF_OK; };
+    host.maker(NMA::CompID_QuickTimeVolumeInfo, nothing);
+    host.maker(NMA::CompID_QuickTimeMediaFormat, nothing);
+    NCFSmartPtr<NMA::IVolumeInfo> info;
+    NCFSmartPtr<NMA::IMediaFormat> format;
+    EXPECT_EQ(volume->GetVolumeInfo(path(folder).inArg(), info.outArg()), NCF_E_UNEXPECTED);
+    EXPECT_EQ(volume->GetMediaFormat(path(folder).inArg(), format.outArg()), NCF_E_UNEXPECTED);
 }
 
 TEST_F(MediaVolume, NeedsAHostWithAFactory) {
@@ -148,7 +170,17 @@ TEST_F(VolumeInfo, IsNamedAfterTheLastComponentOfItsPath) {
 TEST_F(VolumeInfo, HasNoNameWithoutAPath) {
     NCFSmartPtr<INCFString> name;
     EXPECT_EQ(infoFor(text(""))->GetVolumeName(name.outArg()), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(infoFor(text(""))->GetVolumeName(nullptr), NMA_E_NOTINITIALIZED)
+        << "the path is looked at first";
     EXPECT_EQ(infoFor(text("\\a"))->GetVolumeName(nullptr), NCF_E_INVALIDARG);
+}
+
+TEST_F(VolumeInfo, GivesTheRefusalOfTheStringForItsName) {
+    const auto info = infoFor(text("\\a"));
+    host.refuseCreation(NCFCompID_NCFString, NCF_E_OUTOFMEMORY);
+    auto* name = reinterpret_cast<INCFString*>(&host);
+    EXPECT_EQ(info->GetVolumeName(&name), NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(name, nullptr);
 }
 
 TEST_F(VolumeInfo, IsAsNewAsTheNewestMovie) {
