@@ -1,0 +1,32 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <functional>
+#include <map>
+#include <string>
+#include <tr1/memory>
+#include <vector>
+
+#include "source/clips/BaseClip.h"
+
+struct IAAFFile;
+
+// What this program's NMAVolume answers in place of the utility library's.
+struct VolumeDouble {
+    std::vector<std::string> names;
+    std::map<std::string, ncfUInt64> dates;
+    bool throws = false;
+    std::vector<std::string> patterns;  // of the searches so far
+};
+extern VolumeDouble volumeDouble;
+
+// What this program's NewAAFFromMovie does in place of the module's.
+struct DescriptionDouble {
+    // Puts a file with a reference into `*out`, gives a result, or throws.
+    std::function<NCFRESULT(IAAFFile** out)> describe;
+    INCFComponentFactory* factory = nullptr;
+    INCFConsole* console = nullptr;
+    std::vector<std::tr1::weak_ptr<BaseClip>> clips;  // one for each call
+};
+extern DescriptionDouble descriptionDouble;
