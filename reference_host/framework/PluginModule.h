@@ -25,7 +25,7 @@ struct LoadFailure {
 //   open, six functions    NCFRegisterPlugin    NCFRegisterComponent 0, 1, ...
 //   NCFStartup             its components enter the factory's table
 //
-// and unloading back: out of the table, NCFCanUnloadNow, NCFShutdown, close.
+// and unloading back: NCFCanUnloadNow, out of the table, NCFShutdown, close.
 class PluginModule {
 public:
     // Null on failure, with everything undone that was done.

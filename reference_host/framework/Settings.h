@@ -17,7 +17,8 @@ namespace host {
 
 // Settings of the host and of the editor's project: one component with both
 // interfaces. A value that was taken away is answered with
-// NCF_E_PARAMETERNOTAVAILABLE, outputs untouched.
+// NCF_E_PARAMETERNOTAVAILABLE, outputs untouched; a forced rate that isn't there
+// is answered as not enabled.
 class Settings final : public Component<NMA::IHostSettings, INCFNMAEditorSettings> {
 public:
     NCFRESULT GetHostSettingBoolean(const GUID& setting, ncfUInt32 scope, ncfBool* value) override;
