@@ -9,7 +9,7 @@
 #include "source/clips/LoadMedia.h"
 #include "source/components/FileTypes.h"
 #include "source/components/HostServices.h"
-#include "source/components/InterfaceEntry.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/CreationFunctions.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
