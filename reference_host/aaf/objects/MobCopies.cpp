@@ -20,12 +20,8 @@ namespace {
 // Calls for each source reference in an object and in all that it contains.
 void ForEachReference(const Object& object, const std::function<void(SourceReference&)>& call) {
     for (const auto& [pid, value] : object.values()) {
-        for (const RefPtr<Unknown>& element : value->objects()) {
-            Object* const part = dynamic_cast<Object*>(element.get());
-            if (part == nullptr) {
-                continue;
-            }
-            if (SourceReference* const reference = dynamic_cast<SourceReference*>(part)) {
+        for (const RefPtr<Object>& part : value->objects()) {
+            if (SourceReference* const reference = dynamic_cast<SourceReference*>(part.get())) {
                 call(*reference);
             }
             ForEachReference(*part, call);

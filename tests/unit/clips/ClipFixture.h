@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <fstream>
 #include <memory>
 #include <string>
@@ -21,8 +22,7 @@
 class TempFile {
 public:
     explicit TempFile(const std::vector<ncfUInt8>& bytes, const std::string& name = "clip.mov")
-        : path_(testing::TempDir() + std::to_string(reinterpret_cast<std::uintptr_t>(this)) + "_" +
-                name) {
+        : path_(testing::TempDir() + UniquePrefix() + name) {
         std::ofstream file(path_, std::ios::binary);
         file.write(reinterpret_cast<const char*>(bytes.data()),
                    static_cast<std::streamsize>(bytes.size()));
@@ -34,6 +34,16 @@ public:
     const std::string& path() const { return path_; }
 
 private:
+    // Tests run side by side, each in a process of its own.
+    static std::string UniquePrefix() {
+        static int count = 0;
+        const auto* const test = testing::UnitTest::GetInstance()->current_test_info();
+        std::string prefix = std::string(test->test_suite_name()) + "_" + test->name() + "_" +
+                             std::to_string(++count) + "_";
+        std::replace(prefix.begin(), prefix.end(), '/', '_');
+        return prefix;
+    }
+
     std::string path_;
 };
 

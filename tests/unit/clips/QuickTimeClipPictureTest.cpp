@@ -183,6 +183,21 @@ TEST_F(QuickTimeClipPicture, LaysTheUsersChoiceOverTheFields) {
     }
 }
 
+TEST_F(QuickTimeClipPicture, LetsTheUserTurnTheFieldsRound) {
+    struct {
+        bool topInFile;
+        ncfUInt32 chosen;
+    } const kTurns[] = {{false, 512}, {true, 4096}};
+    for (const auto& turn : kTurns) {
+        Picture().SetFields(2, turn.topInFile, false);
+        Load();
+        clip->GetClipParams()->fieldOrderInFile = turn.chosen;
+        EXPECT_EQ(clip->SetFieldLayoutDetails(), NCF_OK);
+        ExpectFields(turn.chosen, 256);
+        EXPECT_EQ(clip->GetClipParams()->detectedFieldOrder, turn.topInFile ? 512u : 4096u);
+    }
+}
+
 TEST_F(QuickTimeClipPicture, IgnoresTheUsersChoiceForProgressivePictures) {
     Load();
     clip->GetClipParams()->fieldOrderInFile = 512;

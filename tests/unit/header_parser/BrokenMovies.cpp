@@ -310,6 +310,20 @@ void AddMovieAtoms(std::vector<BrokenMovie>& list) {
     add("cmov_of_another_size", bytes, NCF_E_FAIL);
 }
 
+// A description with every atom that the parser reads, the texts as raw boxes.
+Box FullDescription() {
+    movies::VideoFormat format;
+    format.fields = {{2, 9}};
+    format.nclc = {{1, 1, 1}};
+    format.pixelAspect = {{10, 11}};
+    format.cleanAperture = {{704, 1, 480, 1, 0, 1, 0, 1}};
+    format.extensions = {Box("chRI").Text("<Bounds></Bounds>"),
+                         Box("chCM").Text("<ColorSpaceDescriptor/>")};
+    format.alphaCodings = {{0, 1}};
+    format.resolutionId = 10950;
+    return format.ToBox();
+}
+
 }  // namespace
 
 std::vector<BrokenMovie> BrokenMovies() {
@@ -350,15 +364,7 @@ std::vector<BrokenMovie> WholeMovies() {
         track.samples.push_back({1, 120, 1, 2, false, false});
     }
     track.edits = {{100, -1, 1.0}, {500, 1, 1.0}, {100, 10, 0.5}};
-    movies::VideoFormat format;
-    format.fields = {{2, 9}};
-    format.nclc = {{1, 1, 1}};
-    format.pixelAspect = {{10, 11}};
-    format.cleanAperture = {{704, 1, 480, 1, 0, 1, 0, 1}};
-    format.rasterText.emplace("<Bounds></Bounds>");
-    format.alphaCodings = {{0, 1}};
-    format.resolutionId = 10950;
-    track.descriptions = {format.ToBox(), movies::VideoFormat().ToBox()};
+    track.descriptions = {FullDescription(), movies::VideoFormat().ToBox()};
     add("reordered_with_edits_and_attributes", movie);
     return list;
 }

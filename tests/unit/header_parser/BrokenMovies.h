@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <ostream>
 #include <string>
 #include <vector>
 
@@ -15,6 +16,11 @@ struct BrokenMovie {
     movies::Bytes bytes;
     NCFRESULT expected;
 };
+
+// How a test that fails calls it.
+inline void PrintTo(const BrokenMovie& movie, std::ostream* out) {
+    *out << movie.name;
+}
 
 std::vector<BrokenMovie> BrokenMovies();
 

@@ -7,6 +7,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <random>
 
 #include "tests/unit/header_parser/ParsedMovie.h"
 
@@ -23,7 +24,8 @@ protected:
         }
         const auto* test = testing::UnitTest::GetInstance()->current_test_info();
         file_ = std::filesystem::temp_directory_path() /
-                (std::string("header_parser_") + test->name() + ".mov");
+                (std::string("header_parser_") + test->name() + "_" +
+                 std::to_string(std::random_device()()) + ".mov");
     }
     void TearDown() override {
         std::error_code ignored;
