@@ -53,7 +53,10 @@ NCFRESULT QuickTimeProperty::GetCodecPixelFormats(INCFBuffer** codes, ncfUInt32*
         if (result < 0) {
             return result;
         }
-        XX* count = static_cast<ncfUInt32>(pixels_->layouts.size());
+        if (bytes > 0) {
+            std::memcpy(start, pixels_->layouts.data(), bytes);
+        }
+        *count = static_cast<ncfUInt32>(pixels_->layouts.size());
         *codes = Ref<INCFBuffer>(buffer).Detach();
         return NCF_OK;
     });
