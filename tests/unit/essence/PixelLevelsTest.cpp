@@ -112,6 +112,29 @@ TEST(PixelLevels, EverySixteenBitValueInEveryPlaceAndMode) {
     }
 }
 
+// A single pixel is no whole block: the tables do it.
+TEST(PixelLevels, EveryValueOfASinglePixelOrLess) {
+    for (const ncfUInt32 mode : {ncfUInt32{Expand_Levels}, ncfUInt32{Compress_Levels}}) {
+        for (int value = 0; value < 256; ++value) {
+            const auto byte = static_cast<ncfUInt8>(value);
+            const ncfUInt8 mapped = Mapped8(byte, mode);
+            ASSERT_EQ(Remapped(PF_BGRA, CT_UCHAR, {byte, byte, byte, byte}, mode),
+                      (Bytes{mapped, mapped, mapped, 255}));
+        }
+        for (int value = 0; value < 65536; ++value) {
+            const auto high = static_cast<ncfUInt8>(value >> 8);
+            const auto low = static_cast<ncfUInt8>(value);
+            const ncfUInt16 mapped = Mapped16(static_cast<ncfUInt16>(value), mode);
+            const auto mappedHigh = static_cast<ncfUInt8>(mapped >> 8);
+            const auto mappedLow = static_cast<ncfUInt8>(mapped);
+            ASSERT_EQ(Remapped(PF_ARGB, CT_USHORT_BE_VideoRange, {1, 2, high, low}, mode),
+                      (Bytes{255, 255, mappedHigh, mappedLow}));
+            ASSERT_EQ(Remapped(PF_BGRA, CT_USHORT_10_6, {low, high, 1}, mode),
+                      (Bytes{mappedLow, mappedHigh, 1}));
+        }
+    }
+}
+
 TEST(PixelLevels, OtherLayoutsPassUntouchedInEveryMode) {
     const Bytes pixels = {16, 0, 235, 9, 16, 0, 235, 9};
     const std::pair<ncfUInt32, ncfUInt32> others[] = {
