@@ -11,6 +11,7 @@ class TemporalOffset : public MappingFixture {
 protected:
     void Samples(std::vector<ncfSInt64> offsets, ncfSInt64 duration = 1000) {
         clip->video.clear();
+        mapping->_mediaTracks.clear();
         AddVideo(7, std::move(offsets)).duration = duration;
         Bind();
     }
@@ -49,6 +50,17 @@ TEST_F(TemporalOffset, FindsThePartnerOneStepAhead) {
     Samples({2000, -1000, -1000, 0});
     EXPECT_EQ(Ask(0), NCF_OK);
     EXPECT_EQ(offset, 1);
+}
+
+TEST_F(TemporalOffset, PartnerMayFallShortByATenthInEitherDirection) {
+    Samples({5000, -900, 5000, 0});
+    EXPECT_EQ(Ask(0), NCF_OK);
+    EXPECT_EQ(offset, 1);
+    Samples({900, 5000});
+    EXPECT_EQ(Ask(1), NCF_OK);
+    EXPECT_EQ(offset, -1);
+    Samples({899, 5000});
+    EXPECT_EQ(Ask(1), NCF_E_FAIL) << "one less is too far off";
 }
 
 TEST_F(TemporalOffset, FollowsAReorderedGroup) {
