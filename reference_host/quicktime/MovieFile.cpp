@@ -25,6 +25,13 @@ constexpr ncfSInt64 kSecondsTo1970 = 2082844800;
 
 constexpr unsigned kTimecodeTag = MKTAG('t', 'm', 'c', 'd');
 
+// All bits set, in the width of either version of a header, means unknown.
+template <class Number>
+bool IsKnownDuration(Number duration) {
+    return duration > 0 && duration != Number{0xFFFFFFFF} &&
+           duration != std::numeric_limits<Number>::max();
+}
+
 }  // namespace
 
 std::unique_ptr<MovieFile> MovieFile::Open(const std::filesystem::path& path, std::string& reason) {
@@ -133,11 +140,31 @@ AVFieldOrder MovieFile::ContainerFieldOrder(ncfUInt32 track) const {
                : told_[static_cast<std::size_t>(stream)].fieldOrder;
 }
 
+// Samples by the time that the media takes, without regard to edits. 0.0 where
+// the container does not tell both.
+double MovieFile::MeanRateOfMedia(int stream) const {
+    std::string ignored;
+    const InputOwner whole =
+        IndexIsWhole() ? OpenInput(path_, InputView::WholeMedia, ignored) : nullptr;
+    if (!whole || stream >= static_cast<int>(whole->nb_streams)) {
+        return 0.0;
+    }
+    const AVStream& of = *whole->streams[stream];
+    return of.nb_frames > 0 && IsKnownDuration(of.duration)
+               ? static_cast<double>(of.nb_frames) /
+                     (static_cast<double>(of.duration) * av_q2d(of.time_base))
+               : 0.0;
+}
+
 double MovieFile::PictureRate() {
     const ncfUInt32 track = FirstVideo();
     const int stream = StreamOf(track);
     if (stream < 0) {
         return 0.0;
+    }
+    const double mean = MeanRateOfMedia(stream);
+    if (mean > 0.0) {
+        return mean;
     }
     AVRational rate = told_[static_cast<std::size_t>(stream)].rate;
     if (rate.num <= 0 || rate.den <= 0) {
@@ -164,8 +191,43 @@ ncfUInt64 MovieFile::CountPictures(ncfUInt64 enough) {
     return std::min(counted_, enough);
 }
 
-double MovieFile::Seconds(ncfUInt32 track) const {
-    const double movie = atoms_.timeScale > 0 && atoms_.duration > 0
+// From the first packet's display to the end of the last, where no header tells.
+double MovieFile::SecondsOfPackets(int stream) {
+    const auto known = secondsOfPackets_.find(stream);
+    if (known != secondsOfPackets_.end()) {
+        return known->second;
+    }
+    double seconds = 0.0;
+    std::string ignored;
+    const InputOwner input = OpenInput(path_, InputView::AsPresented, ignored);
+    if (input && stream < static_cast<int>(input->nb_streams)) {
+        ncfSInt64 first = std::numeric_limits<ncfSInt64>::max();
+        ncfSInt64 end = std::numeric_limits<ncfSInt64>::min();
+        for (const PacketEntry& packet : ListPackets(*input, stream, IndexIsWhole())) {
+            if (packet.displayTime != AV_NOPTS_VALUE) {
+                first = std::min(first, packet.displayTime);
+                end = std::max(end, packet.displayTime + packet.duration);
+            }
+        }
+        if (end > first) {
+            seconds = (static_cast<double>(end) - static_cast<double>(first)) *
+                      av_q2d(input->streams[stream]->time_base);
+        }
+    }
+    return secondsOfPackets_[stream] = seconds;
+}
+
+double MovieFile::Seconds(ncfUInt32 track) {
+    if (atoms_.isFragmented) {  // its headers speak of the part before the fragments
+        double longest = 0.0;
+        for (std::size_t i = 0; i < numbers_.size(); ++i) {
+            const bool wanted =
+                track == 0 ? IsVideo(numbers_[i]) || IsAudio(numbers_[i]) : numbers_[i] == track;
+            longest = std::max(longest, wanted ? SecondsOfPackets(static_cast<int>(i)) : 0.0);
+        }
+        return longest;
+    }
+    const double movie = atoms_.timeScale > 0 && IsKnownDuration(atoms_.duration)
                              ? static_cast<double>(atoms_.duration) / atoms_.timeScale
                          : input_->duration > 0
                              ? static_cast<double>(input_->duration) / AV_TIME_BASE
@@ -174,11 +236,11 @@ double MovieFile::Seconds(ncfUInt32 track) const {
         return movie;
     }
     const MovieAtoms::Track* const atoms = atoms_.Find(track);
-    if (atoms && atoms->duration > 0 && atoms_.timeScale > 0 && !atoms_.isFragmented) {
+    if (atoms && atoms_.timeScale > 0 && IsKnownDuration(atoms->duration)) {
         return static_cast<double>(atoms->duration) / atoms_.timeScale;
     }
     const AVStream* const stream = FindTrack(track);
-    return stream && stream->duration > 0
+    return stream && IsKnownDuration(stream->duration)
                ? static_cast<double>(stream->duration) * av_q2d(stream->time_base)
                : movie;
 }

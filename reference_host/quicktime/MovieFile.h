@@ -51,7 +51,7 @@ public:
     // Pictures that the first picture track presents, at most `enough`.
     ncfUInt64 CountPictures(ncfUInt64 enough);
     // Seconds of a track, or of the movie for 0.
-    double Seconds(ncfUInt32 track) const;
+    double Seconds(ncfUInt32 track);
 
     // Seconds from 1904-01-01 UTC, 0 when the movie does not say.
     ncfUInt64 CreationTime() const;
@@ -59,6 +59,8 @@ public:
 private:
     MovieFile(std::filesystem::path path, InputOwner input);
     void NumberTracks();
+    double MeanRateOfMedia(int stream) const;
+    double SecondsOfPackets(int stream);
     ncfUInt32 FirstWhere(bool (MovieFile::*test)(ncfUInt32) const) const;
 
     std::filesystem::path path_;
@@ -73,6 +75,7 @@ private:
     bool hasDetails_ = false;
     ncfUInt64 counted_ = 0;  // pictures found so far
     bool countedAll_ = false;
+    std::map<int, double> secondsOfPackets_;
 };
 
 }  // namespace host

@@ -22,6 +22,8 @@ PictureOrder::PictureOrder(std::vector<PacketEntry> packets) : packets_(std::mov
     pictureOf_.assign(packets_.size(), kNone);
     for (std::size_t i = 0; i < packets_.size(); ++i) {
         isIntraOnly_ = isIntraOnly_ && packets_[i].isSync;
+        hasOwnDisplayTimes_ =
+            hasOwnDisplayTimes_ || packets_[i].displayTime != packets_[i].decodeTime;
         if (packets_[i].isShown) {
             pictures_.push_back({i, 0});
         }
@@ -65,14 +67,22 @@ std::optional<std::size_t> PictureOrder::PictureOfPacket(std::size_t packet) con
     return pictureOf_[packet];
 }
 
-std::optional<std::size_t> PictureOrder::Find(ncfSInt64 decodeTime, ncfSInt64 position,
-                                              std::size_t guess) const {
+std::optional<std::size_t> PictureOrder::Find(ncfSInt64 decodeTime, ncfSInt64 displayTime,
+                                              ncfSInt64 position, std::size_t guess) const {
+    const auto agree = [](ncfSInt64 a, ncfSInt64 b, ncfSInt64 unknown) {
+        return a == unknown || b == unknown || a == b;
+    };
     const auto matches = [&](std::size_t i) {
         const PacketEntry& packet = packets_[i];
-        return decodeTime != AV_NOPTS_VALUE && packet.decodeTime != AV_NOPTS_VALUE
-                   ? packet.decodeTime == decodeTime &&
-                         (position < 0 || packet.position < 0 || packet.position == position)
-                   : packet.position == position;
+        if (position >= 0 && packet.position >= 0 && packet.position != position) {
+            return false;
+        }
+        // Times of decoding are guessed by some demuxers, and guessed anew
+        // after a seek.
+        if (hasOwnDisplayTimes_ && displayTime != AV_NOPTS_VALUE) {
+            return packet.displayTime == displayTime;
+        }
+        return agree(decodeTime, packet.decodeTime, AV_NOPTS_VALUE);
     };
     for (std::size_t away = 0; away < packets_.size(); ++away) {
         if (guess + away < packets_.size() && matches(guess + away)) {

@@ -34,7 +34,7 @@ public:
     bool HasDisplayTimes() const { return hasDisplayTimes_; }
 
     // The packet that a demuxer just gave, sought near `guess`.
-    std::optional<std::size_t> Find(ncfSInt64 decodeTime, ncfSInt64 position,
+    std::optional<std::size_t> Find(ncfSInt64 decodeTime, ncfSInt64 displayTime, ncfSInt64 position,
                                     std::size_t guess) const;
 
 private:
@@ -49,6 +49,7 @@ private:
     std::vector<std::size_t> pictureOf_;  // for each packet
     bool isIntraOnly_ = true;
     bool hasDisplayTimes_ = true;
+    bool hasOwnDisplayTimes_ = false;  // apart from those of decoding
 };
 
 }  // namespace host

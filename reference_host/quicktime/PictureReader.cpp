@@ -4,6 +4,7 @@
 #include "reference_host/quicktime/PictureReader.h"
 
 #include <algorithm>
+#include <string_view>
 
 #include "reference_host/quicktime/OpenInput.h"
 
@@ -26,8 +27,18 @@ CodecOwner OpenDecoder(const AVStream& stream) {
     }
     codec->pkt_timebase = stream.time_base;
     codec->thread_count = 0;  // as many as there are processors
+    // Near the end of a stream the decoder would keep good pictures back as well;
+    // those that are damaged it marks.
+    codec->flags |= AV_CODEC_FLAG_OUTPUT_CORRUPT;
     codec->thread_type = FF_THREAD_FRAME | FF_THREAD_SLICE;
     return avcodec_open2(codec.get(), decoder, nullptr) < 0 ? nullptr : std::move(codec);
+}
+
+// Whether every packet carries its time. Where only some do, or none, a packet
+// reached by a seek can't be told from its neighbours.
+bool TellsTimesOfAll(const AVFormatContext& input) {
+    return (input.iformat->flags & AVFMT_NOTIMESTAMPS) == 0 &&
+           std::string_view(input.iformat->name) != "mpeg";
 }
 
 bool IsDamaged(const AVFrame& frame) {
@@ -60,6 +71,7 @@ PictureReader::PictureReader(std::filesystem::path path, InputOwner input, Codec
       codec_(std::move(codec)),
       stream_(stream),
       order_(std::move(order)),
+      isSeekable_(TellsTimesOfAll(*input_)),
       cache_(kMostCachedBytes),
       packet_(av_packet_alloc()) {}
 
@@ -89,14 +101,14 @@ bool PictureReader::MayContinueTo(std::size_t picture) const {
         !order_.IsWholeFrom(picture, runStart_)) {
         return false;
     }
-    return order_.StartFor(picture) <= nextPacket_ + kNearPackets;
+    return !isSeekable_ || order_.StartFor(picture) <= nextPacket_ + kNearPackets;
 }
 
 // Reads the first packet after a seek; keeps it when decoding may start from it.
 bool PictureReader::LandsBefore(std::size_t packet) {
     while (av_read_frame(input_.get(), packet_.get()) >= 0) {
         if (packet_->stream_index == stream_) {
-            const auto found = order_.Find(packet_->dts, packet_->pos, packet);
+            const auto found = order_.Find(packet_->dts, packet_->pts, packet_->pos, packet);
             if (found && *found <= packet) {
                 nextPacket_ = *found;
                 isPending_ = true;
@@ -118,15 +130,10 @@ NCFRESULT PictureReader::StartAt(std::size_t packet) {
     const PacketEntry& entry = order_.Packet(packet);
     runStart_ = packet;
     delivered_ = 0;
-    const auto seek = [&](ncfSInt64 to, int flags) {
-        return to >= 0 || (flags & AVSEEK_FLAG_BYTE) == 0
-                   ? av_seek_frame(input_.get(), stream_, to, flags) >= 0 && LandsBefore(packet)
-                   : false;
-    };
     isRunning_ =
-        (entry.decodeTime != AV_NOPTS_VALUE && seek(entry.decodeTime, AVSEEK_FLAG_BACKWARD)) ||
-        ((input_->iformat->flags & AVFMT_NO_BYTE_SEEK) == 0 &&
-         seek(entry.position, AVSEEK_FLAG_BYTE));
+        isSeekable_ && entry.decodeTime != AV_NOPTS_VALUE &&
+        av_seek_frame(input_.get(), stream_, entry.decodeTime, AVSEEK_FLAG_BACKWARD) >= 0 &&
+        LandsBefore(packet);
     if (!isRunning_) {  // some files can only be read from their start
         std::string ignored;
         if (InputOwner again = OpenInput(path_, InputView::AsPresented, ignored);
@@ -146,8 +153,8 @@ bool PictureReader::Feed() {
     }
     isPending_ = false;
     if (packet_->stream_index == stream_) {
-        const std::size_t at =
-            order_.Find(packet_->dts, packet_->pos, nextPacket_).value_or(nextPacket_);
+        const std::size_t at = order_.Find(packet_->dts, packet_->pts, packet_->pos, nextPacket_)
+                                   .value_or(nextPacket_);
         nextPacket_ = at + 1;
         if (at >= runStart_) {
             codec_->reordered_opaque = static_cast<ncfSInt64>(at);

@@ -48,6 +48,7 @@ private:
     CodecOwner codec_;
     int stream_;
     PictureOrder order_;
+    bool isSeekable_;
     PictureCache cache_;
     PacketOwner packet_;
 
