@@ -16,9 +16,31 @@ bool HaveDisplayTimes(const std::vector<PacketEntry>& packets) {
     });
 }
 
+// Some containers give times to some packets alone. Among pictures that are
+// reordered in the plain way, one that others lean on is shown when the next
+// such one is decoded, and any other at once.
+void FillDisplayTimes(std::vector<PacketEntry>& packets) {
+    ncfSInt64 nextReference = AV_NOPTS_VALUE;
+    for (std::size_t i = packets.size(); i-- > 0;) {
+        PacketEntry& packet = packets[i];
+        const bool isMissing = packet.displayTime == AV_NOPTS_VALUE;
+        if (isMissing && packet.decodeTime != AV_NOPTS_VALUE) {
+            packet.displayTime = nextReference != AV_NOPTS_VALUE
+                                     ? nextReference
+                                     : packet.decodeTime + packet.duration;
+        }
+        if (isMissing || packet.displayTime != packet.decodeTime) {
+            nextReference = packet.decodeTime;
+        }
+    }
+}
+
 }  // namespace
 
 PictureOrder::PictureOrder(std::vector<PacketEntry> packets) : packets_(std::move(packets)) {
+    if (!HaveDisplayTimes(packets_)) {
+        FillDisplayTimes(packets_);
+    }
     pictureOf_.assign(packets_.size(), kNone);
     for (std::size_t i = 0; i < packets_.size(); ++i) {
         isIntraOnly_ = isIntraOnly_ && packets_[i].isSync;
@@ -42,6 +64,9 @@ PictureOrder::PictureOrder(std::vector<PacketEntry> packets) : packets_(std::mov
 }
 
 void PictureOrder::FindStarts() {
+    if (!hasDisplayTimes_) {
+        return;  // pictures are counted, from the first
+    }
     std::vector<std::size_t> syncBefore(packets_.size(), 0);
     std::vector<std::size_t> syncs;
     for (std::size_t i = 0; i < packets_.size(); ++i) {

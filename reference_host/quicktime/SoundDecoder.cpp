@@ -79,10 +79,11 @@ void SoundDecoder::Seek(ncfSInt64 place) {
     const AVCodecParameters& form = *input_->streams[stream_]->codecpar;
     const ncfSInt64 preroll =
         IsLinear(form) ? 0 : std::max<ncfSInt64>(kPrerollFrames, form.seek_preroll);
-    // A start of sound may have a time below zero.
-    ncfSInt64 from = place > preroll ? TimeOf(place - preroll) : zeroTime_;
-    if (av_seek_frame(input_.get(), stream_, from, AVSEEK_FLAG_BACKWARD) < 0) {
-        av_seek_frame(input_.get(), stream_, from, AVSEEK_FLAG_ANY);
+    // What primes a decoder has times below zero.
+    const ncfSInt64 from = TimeOf(place - preroll);
+    if (av_seek_frame(input_.get(), stream_, from, AVSEEK_FLAG_BACKWARD) < 0 &&
+        av_seek_frame(input_.get(), stream_, std::max(from, zeroTime_), AVSEEK_FLAG_BACKWARD) < 0) {
+        av_seek_frame(input_.get(), stream_, zeroTime_, AVSEEK_FLAG_ANY);
     }
     avcodec_flush_buffers(codec_.get());
     isRunning_ = true;
