@@ -54,7 +54,7 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     }
     InputOwner input(opened);
     if (!AreStreamsKnown(*input)) {
-        avformat_find_stream_info(input.get(), nullptr);
+        FindStreamDetails(*input);
     }
     if (input->nb_streams == 0) {
         reason = "the file holds no tracks";
@@ -75,7 +75,12 @@ bool IsStillPicture(const AVFormatContext& input) {
 }
 
 void FindStreamDetails(AVFormatContext& input) {
-    avformat_find_stream_info(&input, nullptr);
+    static char mark;
+    // The library does not survive being asked twice.
+    if (input.opaque != &mark) {
+        input.opaque = &mark;
+        avformat_find_stream_info(&input, nullptr);
+    }
 }
 
 void UseOneStream(AVFormatContext& input, int stream) {
