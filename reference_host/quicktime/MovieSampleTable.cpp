@@ -12,8 +12,9 @@
 namespace host {
 namespace {
 
-// Packets without a decode time count on from the one before.
-void FillDecodeTimes(std::vector<PacketEntry>& packets) {
+// Packets without a decode time count on from the one before. The last lasts to
+// the end of the media, or as long as the one before it.
+void FillDecodeTimes(std::vector<PacketEntry>& packets, ncfSInt64 mediaDuration) {
     ncfSInt64 next = 0;
     for (PacketEntry& packet : packets) {
         if (packet.decodeTime == AV_NOPTS_VALUE) {
@@ -26,6 +27,14 @@ void FillDecodeTimes(std::vector<PacketEntry>& packets) {
     }
     for (std::size_t i = 0; i + 1 < packets.size(); ++i) {
         packets[i].duration = packets[i + 1].decodeTime - packets[i].decodeTime;
+    }
+    if (packets.empty() || packets.back().duration > 0) {
+        return;
+    }
+    PacketEntry& last = packets.back();
+    last.duration = packets.front().decodeTime + mediaDuration - last.decodeTime;
+    if (mediaDuration <= 0 || last.duration <= 0) {
+        last.duration = packets.size() > 1 ? packets[packets.size() - 2].duration : 0;
     }
 }
 
@@ -53,7 +62,7 @@ MovieSampleTable::Track MovieSampleTable::Load(int stream) const {
         input->flags |= AVFMT_FLAG_NOFILLIN | AVFMT_FLAG_NOPARSE;
     }
     track.packets = ListPackets(*input, stream, indexIsWhole_);
-    FillDecodeTimes(track.packets);
+    FillDecodeTimes(track.packets, input->streams[stream]->duration);
     track.samples = track.packets.size();
     track.runEnds = RunEnds(track.packets);
     SoundForm form;
