@@ -4,9 +4,9 @@
 
 #include "host_interfaces/media/AAFClips.h"
 
-struct ISampleMapping;
-
 namespace NMA {
+
+struct ISampleMapping;
 
 // The host's handle on one media file. One thread at a time.
 struct IMediaContainer : INCFUnknown {
@@ -25,8 +25,9 @@ protected:
 };
 
 struct IMediaContainer2 : IMediaContainer {
-    virtual NCFRESULT GetSampleMapping(ISampleMapping** ppSampleMapping) = 0;  // 8
-    virtual NCFRESULT ContainerUnsupportedB(void* a) = 0;                      // 9
+    // 8. A new mapping over the clip, which it shares with all others.
+    virtual NCFRESULT GetSampleMapping(ISampleMapping** ppSampleMapping) = 0;
+    virtual NCFRESULT ContainerUnsupportedB(void* a) = 0;  // 9
 
 protected:
     ~IMediaContainer2() = default;
@@ -57,5 +58,3 @@ constexpr const GUID& ncfIdOf(const IMediaContainer3*) {
 }
 
 }  // namespace NMA
-
-inline constexpr GUID IID_ISampleMapping = ncfGuid("E0D63190-0469-4807-92CE-5C22152F84EB");

@@ -6,6 +6,9 @@
 
 namespace QTWrapper {
 
+// The one mode in which a video reader is started.
+inline constexpr ncfUInt32 kUseDecompressionSession = 0;
+
 // Decodes pictures of the movie's first video track. Frame i is the i-th
 // presented picture in display order, edit list applied.
 struct IQTVideoReader : INCFUnknown {

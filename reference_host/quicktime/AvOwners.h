@@ -7,6 +7,7 @@
 extern "C" {
 #include <libavcodec/avcodec.h>
 #include <libavformat/avformat.h>
+#include <libswscale/swscale.h>
 }
 
 namespace host {
@@ -17,5 +18,25 @@ struct CloseInput {
     void operator()(AVFormatContext* context) const { avformat_close_input(&context); }
 };
 using InputOwner = std::unique_ptr<AVFormatContext, CloseInput>;
+
+struct FreeCodec {
+    void operator()(AVCodecContext* context) const { avcodec_free_context(&context); }
+};
+using CodecOwner = std::unique_ptr<AVCodecContext, FreeCodec>;
+
+struct FreeFrame {
+    void operator()(AVFrame* frame) const { av_frame_free(&frame); }
+};
+using FrameOwner = std::unique_ptr<AVFrame, FreeFrame>;
+
+struct FreePacket {
+    void operator()(AVPacket* packet) const { av_packet_free(&packet); }
+};
+using PacketOwner = std::unique_ptr<AVPacket, FreePacket>;
+
+struct FreeScaler {
+    void operator()(SwsContext* scaler) const { sws_freeContext(scaler); }
+};
+using ScalerOwner = std::unique_ptr<SwsContext, FreeScaler>;
 
 }  // namespace host

@@ -3,11 +3,14 @@
 #pragma once
 
 #include <filesystem>
+#include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "host_interfaces/framework/Types.h"
 #include "reference_host/quicktime/AvOwners.h"
+#include "reference_host/quicktime/MovieAtoms.h"
 
 namespace host {
 
@@ -18,24 +21,61 @@ public:
     // Null with a sentence in `reason` that says what was wrong.
     static std::unique_ptr<MovieFile> Open(const std::filesystem::path& path, std::string& reason);
 
+    const std::filesystem::path& Path() const { return path_; }
+    const AVFormatContext& Input() const { return *input_; }
+    const MovieAtoms& Atoms() const { return atoms_; }
+    // Whether the container's index names every sample.
+    bool IndexIsWhole() const;
+
     // The stream of a track; null for a track that there is not.
     const AVStream* FindTrack(ncfUInt32 track) const;
+    int StreamOf(ncfUInt32 track) const;  // -1 for none
     ncfUInt32 HighestTrack() const;
     ncfUInt32 TrackCount() const { return static_cast<ncfUInt32>(numbers_.size()); }
+    const std::vector<ncfUInt32>& Numbers() const { return numbers_; }  // in stream order
 
     bool IsVideo(ncfUInt32 track) const;  // pictures attached to sound are none
     bool IsAudio(ncfUInt32 track) const;
     bool IsTimecode(ncfUInt32 track) const;
+    ncfUInt32 FirstVideo() const;  // 0 for none
+    ncfUInt32 FirstAudio() const;
+    std::map<ncfUInt32, int> StreamsByTrack() const;
+
+    // What the headers left open is read from the media before this answers.
+    const AVStream* FindDetailedTrack(ncfUInt32 track);
+    // Field order and rate as the container tells them, before that.
+    AVFieldOrder ContainerFieldOrder(ncfUInt32 track) const;
+    // Pictures a second of the first picture track, 0.0 when nothing tells.
+    double PictureRate();
+
+    // Pictures that the first picture track presents, at most `enough`.
+    ncfUInt64 CountPictures(ncfUInt64 enough);
+    // Seconds of a track, or of the movie for 0.
+    double Seconds(ncfUInt32 track);
 
     // Seconds from 1904-01-01 UTC, 0 when the movie does not say.
     ncfUInt64 CreationTime() const;
 
 private:
-    explicit MovieFile(InputOwner input);
+    MovieFile(std::filesystem::path path, InputOwner input);
     void NumberTracks();
+    double MeanRateOfMedia(int stream) const;
+    double SecondsOfPackets(int stream);
+    ncfUInt32 FirstWhere(bool (MovieFile::*test)(ncfUInt32) const) const;
 
+    std::filesystem::path path_;
     InputOwner input_;
+    MovieAtoms atoms_;
     std::vector<ncfUInt32> numbers_;  // of the stream at the same place
+    struct Told {
+        AVFieldOrder fieldOrder;
+        AVRational rate;
+    };
+    std::vector<Told> told_;  // of each stream, by the container
+    bool hasDetails_ = false;
+    ncfUInt64 counted_ = 0;  // pictures found so far
+    bool countedAll_ = false;
+    std::map<int, double> secondsOfPackets_;
 };
 
 }  // namespace host

@@ -2,13 +2,16 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <memory>
+
 #include "host_interfaces/quicktime/QuickTimeProperty.h"
 #include "reference_host/framework/Component.h"
+#include "reference_host/quicktime/CodecPixels.h"
 
 namespace host {
 
-// Answers about codecs. Pixel formats and storage come with the frames, which
-// this host does not serve yet.
+// Answers about codecs. What a codec's pixels may be delivered as follows from
+// what its decoder gives.
 class QuickTimeProperty final : public Component<QuickTime::IQuickTimeProperty> {
 public:
     NCFRESULT CreateMovie(INCFString* path) override;
@@ -16,6 +19,9 @@ public:
     NCFRESULT GetCodecName(ncfUInt32 codecType, INCFString* name) override;
     NCFRESULT GetCodecStorageType(ncfUInt32* type) override;
     NCFRESULT DoesCodecSupportRGB_CCIR(ncfUInt32* flag) override;
+
+private:
+    std::unique_ptr<CodecPixels> pixels_;  // null until a movie is open
 };
 
 }  // namespace host

@@ -3,62 +3,97 @@
 
 #include "reference_host/quicktime/QuickTimeWrapper.h"
 
+#include "reference_host/framework/Guard.h"
 #include "reference_host/framework/HostPath.h"
-#include "reference_host/quicktime/CodecNames.h"
-#include "reference_host/quicktime/SoundForm.h"
+#include "reference_host/quicktime/AudioReader.h"
+#include "reference_host/quicktime/MovieSampleTable.h"
+#include "reference_host/quicktime/VideoReader.h"
 
 namespace host {
-namespace {
-
-// Fills an output that may be null.
-template <class Out, class Value>
-void Give(Out* out, Value value) {
-    if (out) {
-        *out = static_cast<Out>(value);
-    }
-}
-
-}  // namespace
 
 NCFRESULT QuickTimeWrapper::NewMovieFromFilePath(INCFString* path) {
     movie_.reset();
-    std::filesystem::path file;
-    const NCFRESULT read = PathFrom(path, file);
-    if (read < 0) {
-        return read;
-    }
-    std::string reason;
-    movie_ = MovieFile::Open(file, reason);
-    return movie_ ? NCF_OK : NCF_E_FAIL;
+    return Guarded([&] {
+        std::filesystem::path file;
+        const NCFRESULT read = PathFrom(path, file);
+        if (read < 0) {
+            return read;
+        }
+        std::string reason;
+        movie_ = MovieFile::Open(file, reason);
+        return movie_ ? NCF_OK : NCF_E_FAIL;
+    });
 }
 
-NCFRESULT QuickTimeWrapper::GetAudioInfoForTrack(ncfUInt32 track, ncfUInt32* channels,
-                                                 double* sampleRate, ncfUInt32* formatID,
-                                                 ncfUInt32* formatFlags, ncfUInt32* bytesPerPacket,
-                                                 ncfUInt32* framesPerPacket,
-                                                 ncfUInt32* bitsPerChannel, ncfUInt8* isBigEndian,
-                                                 ncfUInt8* isConstantBitRate) {
+NCFRESULT QuickTimeWrapper::PreparePixelFormat(ncfUInt32 fourCC) {
     if (!movie_) {
         return NMA_E_NOTINITIALIZED;
     }
-    const AVStream* const stream = movie_->FindTrack(track);
-    if (!stream) {
-        return NCF_E_NOTFOUND;
+    return IsKnownLayout(fourCC) ? NCF_OK : NCF_E_NOTSUPPORTED;
+}
+
+NCFRESULT QuickTimeWrapper::GetSampleTable(QTWrapper::IQTWSampleTable** table) {
+    if (!table) {
+        return NCF_E_POINTER;
     }
-    SoundForm form;
-    if (!ReadSoundForm(*stream, form)) {
-        return NCF_E_FAIL;
+    *table = nullptr;
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
     }
-    Give(channels, form.channels);
-    Give(sampleRate, form.sampleRate);
-    Give(formatID, form.formatId);
-    Give(formatFlags, form.formatFlags);
-    Give(bytesPerPacket, form.bytesPerPacket);
-    Give(framesPerPacket, form.framesPerPacket);
-    Give(bitsPerChannel, form.bitsPerChannel);
-    Give(isBigEndian, form.isBigEndian);
-    Give(isConstantBitRate, form.isConstantBitRate);
-    return NCF_OK;
+    return Guarded([&] {
+        *table = MakeRef<MovieSampleTable>(movie_->Path(), movie_->StreamsByTrack(),
+                                           movie_->IndexIsWhole())
+                     .Detach();
+        return NCF_OK;
+    });
+}
+
+NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader) {
+    if (!reader) {
+        return NCF_E_POINTER;
+    }
+    *reader = nullptr;
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    return Guarded([&] {
+        std::map<ncfUInt32, int> streams;
+        for (const auto& [track, stream] : movie_->StreamsByTrack()) {
+            if (movie_->IsAudio(track)) {
+                streams[track] = stream;
+            }
+        }
+        if (streams.empty()) {
+            return NMA_E_NODATA;
+        }
+        *reader = MakeRef<AudioReader>(movie_->Path(), std::move(streams)).Detach();
+        return NCF_OK;
+    });
+}
+
+NCFRESULT QuickTimeWrapper::GetQTVideoReader(QTWrapper::IQTVideoReader** reader) {
+    if (!reader) {
+        return NCF_E_POINTER;
+    }
+    *reader = nullptr;
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    return Guarded([&] {
+        const ncfUInt32 track = movie_->FirstVideo();
+        if (track == 0) {
+            return NMA_E_NODATA;
+        }
+        VideoReader::Source source;
+        source.path = movie_->Path();
+        source.stream = movie_->StreamOf(track);
+        source.indexIsWhole = movie_->IndexIsWhole();
+        const AVCodecParameters& form = *movie_->FindTrack(track)->codecpar;
+        source.width = static_cast<ncfUInt32>(form.width > 0 ? form.width : 0);
+        source.height = static_cast<ncfUInt32>(form.height > 0 ? form.height : 0);
+        *reader = MakeRef<VideoReader>(std::move(source)).Detach();
+        return NCF_OK;
+    });
 }
 
 ncfUInt64 QuickTimeWrapper::GetMovieCreationTime() {
@@ -80,98 +115,39 @@ ncfUInt32 QuickTimeWrapper::GetNumberOfTracks() {
 ncfUInt32 QuickTimeWrapper::GetDescribedTrackCount() {
     return movie_ ? movie_->TrackCount() : 0;
 }
-
 ncfBool QuickTimeWrapper::MovieHasAudio() {
-    const ncfUInt64 highest = GetNumberOfTracks();
-    for (ncfUInt64 track = 1; track <= highest; ++track) {
-        if (IsAudioTrack(static_cast<ncfUInt32>(track))) {
-            return 1;
+    return movie_ && movie_->FirstAudio() != 0;
+}
+
+ncfBool QuickTimeWrapper::GetFirstVideoTrack(ncfUInt32* track) {
+    if (!movie_ || !track || movie_->FirstVideo() == 0) {
+        return 0;
+    }
+    *track = movie_->FirstVideo();
+    return 1;
+}
+
+ncfBool QuickTimeWrapper::MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) {
+    if (!movie_) {
+        return 0;
+    }
+    int count = 0;
+    for (const ncfUInt32 track : movie_->Numbers()) {
+        count += movie_->IsVideo(track);
+    }
+    return count > 1;
+}
+
+ncfUInt32 QuickTimeWrapper::MovieIsSelfContained(ncfUInt32, ncfUInt32, ncfUInt32) {
+    if (!movie_) {
+        return 0;
+    }
+    for (const MovieAtoms::Track& track : movie_->Atoms().tracks) {
+        if (track.needsOtherFiles) {
+            return 0;
         }
     }
-    return 0;
-}
-
-// --- what comes with frames, sound and other containers ------------------------
-
-NCFRESULT QuickTimeWrapper::PreparePixelFormat(ncfUInt32) {
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::GetSampleTable(QTWrapper::IQTWSampleTable** table) {
-    Give(table, nullptr);
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader) {
-    Give(reader, nullptr);
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::GetQTVideoReader(QTWrapper::IQTVideoReader** reader) {
-    Give(reader, nullptr);
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::QueryVideoDescBufferDetails(ncfUInt32*, ncfUInt32*) {
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::GetCodecColorSpaceInfo(ncfBool*, ncfBool*) {
-    return lacking();
-}
-ncfBool QuickTimeWrapper::MovieHasOneFrame() {
-    return 0;
-}
-ncfUInt32 QuickTimeWrapper::GetResolutionId(ncfUInt32) {
-    return 0;
-}
-NCFRESULT QuickTimeWrapper::GetCodecTypeName(ncfUInt32, INCFString*) {
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::MovieTrackDurationIssues(ncfSInt32, ncfSInt32, ncfUInt64, ncfBool*,
-                                                     ncfBool*) {
-    return lacking();
-}
-ncfBool QuickTimeWrapper::MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) {
-    return 0;
-}
-ncfBool QuickTimeWrapper::GetFirstVideoTrack(ncfUInt32*) {
-    return 0;
-}
-ncfBool QuickTimeWrapper::GetFieldLayoutForTrack(ncfUInt32, ncfUInt32*) {
-    return 0;
-}
-NCFRESULT QuickTimeWrapper::GetFourCCFromImageDescrptor(ncfUInt32, ncfUInt8*) {
-    return lacking();
-}
-ncfUInt32 QuickTimeWrapper::GetImageDescriptionCount(ncfUInt32) {
-    return 0;
-}
-NCFRESULT QuickTimeWrapper::MovieContainsAlpha(ncfUInt32, ncfBool*) {
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::GetMovieBox(ncfUInt32*, ncfUInt32*, ncfUInt32*, ncfUInt32*) {
-    return lacking();
-}
-ncfUInt32 QuickTimeWrapper::MovieIsSelfContained(ncfUInt32, ncfUInt32, ncfUInt32) {
-    return 0;
-}
-NCFRESULT QuickTimeWrapper::GetTimeCodeInfoForTrack(ncfUInt32, ncfUInt8*, ncfUInt8*, ncfUInt8*,
-                                                    ncfUInt8*, ncfUInt32*, ncfUInt32*, ncfUInt32*,
-                                                    ncfUInt32*) {
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::DetermineMovieEditRateAndLength(double, double, ncfUInt32, ncfSInt32*,
-                                                            ncfSInt32*, ncfUInt64*, ncfUInt64*,
-                                                            ncfUInt32, ncfBool) {
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::QTWSetMovieBox(ncfSInt16, ncfSInt16, ncfSInt16, ncfSInt16) {
-    return lacking();
-}
-NCFRESULT QuickTimeWrapper::GetVendor(ncfUInt32, ncfUInt32*) {
-    return lacking();
-}
-ncfUInt64 QuickTimeWrapper::GetTrackDuration(ncfUInt32) {
-    return 0;
-}
-ncfUInt32 QuickTimeWrapper::GetMovieTimeScale() {
-    return 0;
+    return 1;
 }
 
 }  // namespace host

@@ -10,9 +10,10 @@
 
 namespace host {
 
-// The movie wrapper over the multimedia library: so far what a description
-// needs. Operations that serve frames, sound and other containers answer
-// NCF_E_NOTIMPL, 0 or false.
+// The movie wrapper over the multimedia library. Readers and sample table open
+// the file for themselves, so they live on when the wrapper has gone. What is
+// told of pictures stands in QuickTimeWrapperPicture.cpp, of single tracks in
+// QuickTimeWrapperTracks.cpp, of rates and lengths in QuickTimeWrapperLengths.cpp.
 class QuickTimeWrapper final : public Component<QTWrapper::IQuickTimeWrapper> {
 public:
     NCFRESULT PreparePixelFormat(ncfUInt32 fourCC) override;
@@ -64,8 +65,9 @@ public:
     ncfUInt32 GetMovieTimeScale() override;
 
 private:
-    // What an operation that this host lacks answers.
-    NCFRESULT lacking() const { return movie_ ? NCF_E_NOTIMPL : NMA_E_NOTINITIALIZED; }
+    NCFRESULT EditRateAndLength(double forcedRate, double editorRate, ncfUInt32 singleFrameDuration,
+                                bool useMovieHeader, double& rate, ncfUInt64& length);
+    const AVStream* DetailedFirstVideo() const;
 
     std::unique_ptr<MovieFile> movie_;  // null until a movie is open
 };

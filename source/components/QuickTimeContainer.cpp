@@ -4,13 +4,15 @@
 #include "source/components/QuickTimeContainer.h"
 
 #include "host_interfaces/aaf/AAFFile.h"
+#include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/util/NMAString.h"
 #include "source/aaf/NewAAFFromMovie.h"
 #include "source/clips/LoadMedia.h"
 #include "source/components/FileTypes.h"
 #include "source/components/HostServices.h"
-#include "source/components/InterfaceEntry.h"
+#include "source/essence/QuickTimeSampleMapping.h"
 #include "source/plugin/CreationFunctions.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
 
@@ -114,8 +116,9 @@ NCFRESULT QuickTimeContainer::SetFilePath(INCFString* path) {
     });
 }
 
-// Sample maps are not served yet.
+// Each call makes a mapping of its own; all of them share the clip.
 NCFRESULT QuickTimeContainer::GetSampleMapping(ISampleMapping** ppSampleMapping) {
+    NCF_FUNCTION("NMA::Impl::QuickTimeContainer::GetSampleMapping");
     return InterfaceEntry([&]() -> NCFRESULT {
         if (ppSampleMapping) {
             *ppSampleMapping = nullptr;
@@ -123,7 +126,28 @@ NCFRESULT QuickTimeContainer::GetSampleMapping(ISampleMapping** ppSampleMapping)
         if (filePath_.isNull() || filePath_->IsEmpty()) {
             return NMA_E_NOTINITIALIZED;
         }
-        return NCF_E_NOTIMPL;
+        if (!ppSampleMapping) {
+            return NCF_E_POINTER;
+        }
+        // clang-format off
+        NCFSmartPtr<ISampleMapping> created;
+        NCF_RETURN_TEXT("componentFactory_->CreateComponent(NMA::CompID_QuickTimeSampleMapping, NULL, IID_ISampleMapping, (void**)ppSampleMapping)",
+                        ncfCreate(componentFactory_.inArg(), NMA::CompID_QuickTimeSampleMapping, IID_ISampleMapping, created));
+        auto* const pSampleMapping = dynamic_cast<QuickTimeSampleMapping*>(created.inArg());
+        if (!pSampleMapping) {
+            if (console_) {
+                console_->Write(1, "Failed to create a QuickTimeSampleMapping component.");
+            }
+            return NCF_E_UNEXPECTED;
+        }
+        NCF_RETURN(pSampleMapping->SetFilePath(filePath_));
+        if (!media_) {
+            NCF_RETURN(LoadMedia(filePath_, console_, componentFactory_, media_));
+        }
+        NCF_RETURN(pSampleMapping->SetMediaContainer(media_));
+        // clang-format on
+        *ppSampleMapping = created.detach();
+        return NCF_OK;
     });
 }
 

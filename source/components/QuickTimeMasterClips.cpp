@@ -8,7 +8,7 @@
 #include "source/aaf/NewAAFFromMovie.h"
 #include "source/clips/LoadMedia.h"
 #include "source/components/HostServices.h"
-#include "source/components/InterfaceEntry.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/components/MoviePattern.h"
 #include "source/plugin/CreationFunctions.h"
 

@@ -5,7 +5,7 @@
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/components/HostServices.h"
-#include "source/components/InterfaceEntry.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/components/QuickTimeMasterClips.h"
 #include "source/plugin/CreationFunctions.h"
 

@@ -6,7 +6,7 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/util/NMAVolume.h"
 #include "source/components/HostServices.h"
-#include "source/components/InterfaceEntry.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/components/MoviePattern.h"
 #include "source/components/QuickTimeMediaFormat.h"
 #include "source/components/QuickTimeVolumeInfo.h"

@@ -7,7 +7,7 @@
 #include <string>
 
 #include "host_interfaces/util/NMAVolume.h"
-#include "source/components/InterfaceEntry.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/components/MoviePattern.h"
 #include "source/plugin/CreationFunctions.h"
 #include "source/plugin/NCFSmartPtr.h"

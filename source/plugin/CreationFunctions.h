@@ -18,6 +18,8 @@ NCFRESULT CreateQuickTimeMasterClips(INCFUnknown* host, INCFUnknown* outer, cons
                                      void** out);
 NCFRESULT CreateQuickTimeVolumeInfo(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
                                     void** out);
+NCFRESULT CreateQuickTimeSampleMapping(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
+                                       void** out);
 NCFRESULT CreateGenericDocHandler(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
                                   void** out);
 

@@ -42,13 +42,13 @@ const ComponentRow kComponents[kComponentCount] = {
      ncfGuid("B7D3689E-DC96-41F2-AC77-DCC8990AA9D5"), 1, 1, &Impl::CreateQuickTimeVolumeInfo},
     {"QuickTimeMediaContainer", CompID_QuickTimeContainer,
      ncfGuid("058B2AEF-CC2F-4652-B8A0-28D773A8DFB1"), 1, 3, &Impl::CreateQuickTimeContainer},
-    // Sample maps and parameters have no creation function yet.
     {"QuickTimeSampleMapping", CompID_QuickTimeSampleMapping,
-     ncfGuid("109B6222-FDAE-42AB-9E1C-A547123901A0"), 1, 3, nullptr},
+     ncfGuid("109B6222-FDAE-42AB-9E1C-A547123901A0"), 1, 3, &Impl::CreateQuickTimeSampleMapping},
     {"QuickTimeClips", CompID_QuickTimeClips,
      ncfGuid("C5D1D369-62EF-46F8-84B8-1700F1153100"), 1, 3, nullptr},
     {"GenericDocumentHandler", kCLSID_GenericDocHandler,
      ncfGuid("A235C6D4-35F8-4A18-8CD1-7E96A8EBF842"), 1, 3, &Impl::CreateGenericDocHandler},
+    // Parameters have no creation function yet.
     {"QTParameters", CompID_QTParameters,
      ncfGuid("5ECB2244-6B8F-41FD-9E36-71EAE5501230"), 1, 3, nullptr},
 };

@@ -5,7 +5,9 @@
 
 #include "host_interfaces/aaf/AAFFile.h"
 #include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "tests/support/fakes/FakeLock.h"
 #include "tests/support/movies/Movie.h"
 #include "tests/unit/components/ComponentFixture.h"
 
@@ -23,6 +25,46 @@ private:
     ncfUInt32 value_;
 };
 
+// A mapping of another make, which answers nothing.
+class ForeignMapping : public FakeObject<NMA::ISampleMapping> {
+public:
+    ncfSInt32 GetNumberOfTracks() override { return 0; }
+    NCFRESULT GetNumberOfChannels(ncfUInt32, ncfUInt32*) override { return kNo; }
+    NCFRESULT GetNumberOfSamples(ncfUInt32, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetSampleStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetSampleSize(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetSamplePosition(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetSampleTemporalOffset(ncfUInt32, ncfUInt64, ncfSInt64*) override { return kNo; }
+    NCFRESULT GetSampleProperties(ncfUInt32, ncfUInt64, ncfUInt64*, ncfUInt32*) override {
+        return kNo;
+    }
+    NCFRESULT GetSampleDependency(ncfUInt32, ncfUInt64, ncfUInt32, ncfSInt64*) override {
+        return kNo;
+    }
+    NCFRESULT GetNumberOfEncodedUnits(ncfUInt32, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetEncodedUnitStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetEncodedUnitPosition(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetEncodedUnitSize(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetEncodedUnitSizeInSamples(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetEncodedUnitFirstSample(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetEncodedUnitContainingSample(ncfUInt32, ncfUInt64, ncfUInt64*) override {
+        return kNo;
+    }
+    NCFRESULT GetNumberOfContiguousSamples(ncfUInt32, ncfUInt64, ncfSInt64*) override {
+        return kNo;
+    }
+    NCFRESULT GetNumberOfContiguousBytes(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
+    NCFRESULT GetNumberOfContiguousEncodedUnits(ncfUInt32, ncfUInt64, ncfSInt64*) override {
+        return kNo;
+    }
+    NCFRESULT RegisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override { return kNo; }
+    NCFRESULT UnregisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override { return kNo; }
+    NCFRESULT SetStorageCallback(INCFUnknown*) override { return kNo; }
+
+private:
+    static constexpr NCFRESULT kNo = NCF_E_NOTIMPL;
+};
+
 // A container that the host's own header parser serves.
 class Container : public ComponentFixture {
 protected:
@@ -37,6 +79,13 @@ protected:
     void useCapability(ncfUInt32 value) {
         host.maker(CompID_Capability, [value](const GUID&, void** out) {
             *out = static_cast<INCFCapability*>(new FakeCapability(value));
+            return NCF_OK;
+        });
+    }
+    void serveMappings() {
+        serve(NMA::CompID_QuickTimeSampleMapping, NMA::Impl::CreateQuickTimeSampleMapping);
+        host.maker(CompID_LockComponent, [](const GUID&, void** out) {
+            *out = static_cast<INCFLock*>(new FakeLock);
             return NCF_OK;
         });
     }
@@ -315,16 +364,106 @@ TEST_F(Container, IsNotSupportedWithoutAPath) {
 // --- sample mapping -----------------------------------------------------------------------
 
 TEST_F(Container, HasNoSampleMappingBeforeItsPath) {
-    auto* mapping = reinterpret_cast<ISampleMapping*>(&host);
+    auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
     EXPECT_EQ(container()->GetSampleMapping(&mapping), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(mapping, nullptr);
 }
 
-TEST_F(Container, ServesNoSampleMappingYet) {
+TEST_F(Container, MakesAMappingOverItsClipAtEachRequest) {
+    serveMappings();
     const auto object = container();
     object->SetFilePath(path(writeMovie()).inArg());
-    auto* mapping = reinterpret_cast<ISampleMapping*>(&host);
-    EXPECT_EQ(object->GetSampleMapping(&mapping), NCF_E_NOTIMPL);
+    NCFSmartPtr<NMA::ISampleMapping> first;
+    NCFSmartPtr<NMA::ISampleMapping> second;
+    ASSERT_EQ(object->GetSampleMapping(first.outArg()), NCF_OK);
+    ASSERT_EQ(object->GetSampleMapping(second.outArg()), NCF_OK);
+    EXPECT_NE(first.inArg(), second.inArg());
+    EXPECT_EQ(host.creations(NCFCompID_QTParser), 1) << "one clip";
+    ncfUInt64 samples = 0;
+    EXPECT_EQ(first->GetNumberOfTracks(), 1);
+    EXPECT_EQ(first->GetNumberOfSamples(0, &samples), NCF_OK);
+    EXPECT_EQ(samples, 50u);
+    EXPECT_EQ(second->GetNumberOfSamples(0, &samples), NCF_OK);
+}
+
+TEST_F(Container, MappingOutlivesItsContainer) {
+    serveMappings();
+    NCFSmartPtr<NMA::ISampleMapping> mapping;
+    {
+        const auto object = container();
+        object->SetFilePath(path(writeMovie()).inArg());
+        ASSERT_EQ(object->GetSampleMapping(mapping.outArg()), NCF_OK);
+    }
+    ncfUInt64 samples = 0;
+    EXPECT_EQ(mapping->GetNumberOfSamples(0, &samples), NCF_OK);
+    EXPECT_EQ(samples, 50u);
+}
+
+TEST_F(Container, CanStillBeDescribedAfterAMapping) {
+    serveMappings();
+    const auto object = container();
+    object->SetFilePath(path(writeMovie()).inArg());
+    NCFSmartPtr<NMA::ISampleMapping> mapping;
+    ASSERT_EQ(object->GetSampleMapping(mapping.outArg()), NCF_OK);
+    EXPECT_EQ(object->IsContainerSupported(), 1) << "the path is in another encoding now";
+}
+
+TEST_F(Container, MappingNeedsAnOutput) {
+    serveMappings();
+    const auto object = container();
+    object->SetFilePath(path(writeMovie()).inArg());
+    EXPECT_EQ(object->GetSampleMapping(nullptr), NCF_E_POINTER);
+}
+
+TEST_F(Container, GivesTheFailureToMakeAMapping) {
+    RecordingLog log(host);
+    const auto object = container();
+    object->SetFilePath(path(writeMovie()).inArg());
+    auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
+    EXPECT_EQ(object->GetSampleMapping(&mapping), NCF_CLASS_E_CLASSNOTAVAILABLE);
+    EXPECT_EQ(mapping, nullptr);
+    EXPECT_EQ(log.count("NCF_RETURN(0x80040111): "
+                        "componentFactory_->CreateComponent(NMA::CompID_QuickTimeSampleMapping, "
+                        "NULL, IID_ISampleMapping, (void**)ppSampleMapping) : "
+                        "NMA::Impl::QuickTimeContainer::GetSampleMapping"),
+              1);
+}
+
+TEST_F(Container, TellsTheUserOfAMappingThatIsNotTheModulesOwn) {
+    const auto object = container();
+    object->SetFilePath(path(writeMovie()).inArg());
+    const auto refused = [&] {
+        host.console().clear();
+        auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
+        EXPECT_EQ(object->GetSampleMapping(&mapping), NCF_E_UNEXPECTED);
+        EXPECT_EQ(mapping, nullptr);
+        EXPECT_EQ(host.console().count(1, "Failed to create a QuickTimeSampleMapping component."),
+                  1);
+    };
+    host.maker(NMA::CompID_QuickTimeSampleMapping, [](const GUID&, void** out) {
+        *out = nullptr;
+        return NCF_OK;
+    });
+    refused();
+    host.maker(NMA::CompID_QuickTimeSampleMapping, [](const GUID&, void** out) {
+        *out = static_cast<NMA::ISampleMapping*>(new ForeignMapping);
+        return NCF_OK;
+    });
+    refused();
+    EXPECT_EQ(LiveFakes(), 2) << "host and console: what was made is released";
+}
+
+TEST_F(Container, MappingOfAFileThatIsNoMovieFailsAndLeavesNothing) {
+    serveMappings();
+    const auto object = container();
+    object->SetFilePath(path(write("a.mov", "no movie")).inArg());
+    auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
+    EXPECT_EQ(object->GetSampleMapping(&mapping), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(mapping, nullptr);
+    const auto absent = container();
+    absent->SetFilePath(path(folder / "absent.mov").inArg());
+    mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
+    EXPECT_EQ(absent->GetSampleMapping(&mapping), NCF_E_HANDLE);
     EXPECT_EQ(mapping, nullptr);
 }
 

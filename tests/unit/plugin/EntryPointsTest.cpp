@@ -54,6 +54,7 @@ STAND_IN(CreateQuickTimeMediaVolume)
 STAND_IN(CreateQuickTimeMediaFormat)
 STAND_IN(CreateQuickTimeMasterClips)
 STAND_IN(CreateQuickTimeVolumeInfo)
+STAND_IN(CreateQuickTimeSampleMapping)
 STAND_IN(CreateGenericDocHandler)
 }  // namespace NMA::Impl
 
@@ -245,7 +246,7 @@ constexpr ExpectedComponent kExpected[] = {
     {"QuickTimeMediaContainer", "781F84B7-B989-4534-8A07-C595CB9A6FB8",
      "058B2AEF-CC2F-4652-B8A0-28D773A8DFB1", "1.3", true},
     {"QuickTimeSampleMapping", "0E74B673-0CA8-403B-A142-986D79508637",
-     "109B6222-FDAE-42AB-9E1C-A547123901A0", "1.3", false},
+     "109B6222-FDAE-42AB-9E1C-A547123901A0", "1.3", true},
     {"QuickTimeClips", "C7D2D55A-0A1A-44B3-A7D3-5D78EC80FAD8",
      "C5D1D369-62EF-46F8-84B8-1700F1153100", "1.3", false},
     {"GenericDocumentHandler", "4E40C813-86AD-4275-92CC-3AAB04EB1689",
@@ -338,7 +339,7 @@ TEST_F(EntryPoints, GiveAClassFactoryForEveryClassThatIsServed) {
                                     "CreateQuickTimeMasterClips",
                                     "CreateQuickTimeVolumeInfo",
                                     "CreateQuickTimeContainer",
-                                    nullptr,
+                                    "CreateQuickTimeSampleMapping",
                                     nullptr,
                                     "CreateGenericDocHandler",
                                     nullptr};

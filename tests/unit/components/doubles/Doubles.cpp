@@ -30,7 +30,9 @@ INCFString* NMAVolume::GetNextFile(void*& handle) {
         return nullptr;
     }
     handle = name + 1;
-    return MakeHostString(*name);
+    INCFString* const made = MakeHostString(*name);
+    volumeDouble.handedOut.push_back(made);
+    return made;
 }
 
 ncfUInt64 NMAVolume::GetModificationDate(INCFString* name) {

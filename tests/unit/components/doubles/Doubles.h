@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "source/clips/BaseClip.h"
+#include "source/plugin/NCFSmartPtr.h"
 
 struct IAAFFile;
 
@@ -18,6 +19,7 @@ struct VolumeDouble {
     std::map<std::string, ncfUInt64> dates;
     bool throws = false;
     std::vector<std::string> patterns;  // of the searches so far
+    std::vector<NCFSmartPtr<INCFString>> handedOut;
 };
 extern VolumeDouble volumeDouble;
 

@@ -11,6 +11,13 @@ namespace {
 class Scans : public ComponentFixture {
 protected:
     Scans() { volumeDouble = {}; }
+    ~Scans() override {
+        for (const NCFSmartPtr<INCFString>& name : volumeDouble.handedOut) {
+            name->AddRef();
+            EXPECT_EQ(name->Release(), 1u) << "a name was kept";
+        }
+        volumeDouble = {};
+    }
 
     NCFSmartPtr<NMA::IVolumeInfo> info() {
         NCFSmartPtr<NMA::IVolumeInfo> made;

@@ -1,0 +1,147 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "host_interfaces/framework/AVBuffer.h"
+
+// How the host reaches the essence of one movie. All four interfaces belong to
+// one object. Tracks are the host's numbers, `trackNMA`: the picture, its alpha
+// if the clip shows one, then the sound tracks, from zero. Samples count from
+// zero too. An operation that refuses answers NCF_E_NOTIMPL.
+namespace NMA {
+
+// Delivers decoded samples in the formats that were chosen before.
+struct ISampleProvider : INCFUnknown {
+    // 3. Starts the reader of a picture track whose format is chosen; nothing
+    // to do for any other.
+    virtual NCFRESULT Setup(ncfUInt32 trackNMA) = 0;
+    virtual NCFRESULT ProviderUnsupportedOperation(ncfUInt32 trackNMA, ncfUInt64, ncfUInt64) = 0;
+    // 5. One picture, or any number of sound samples. Blocks while it decodes.
+    // One positive answer, 0x0AEA0066: the picture may not be read.
+    virtual NCFRESULT ProvideSampleRange(INCFAVBuffer* pAVBuffer, ncfUInt32 flags) = 0;
+    virtual NCFRESULT ProviderNoOperationA(ncfUInt32 trackNMA, ncfUInt64, ncfUInt64) = 0;  // 6
+    virtual NCFRESULT ProviderNoOperationB() = 0;                                          // 7
+    virtual NCFRESULT Cleanup(ncfUInt32 trackNMA) = 0;  // 8. Undoes Setup.
+
+protected:
+    ~ISampleProvider() = default;
+};
+
+// Formats of picture and alpha tracks. The list of a track only grows, so an
+// index stays good. The query for this interface makes the lists; when that
+// fails the query gives the failure and a pointer that must be released.
+struct IUncompressedImageProvider : INCFUnknown {
+    virtual NCFRESULT GetNumberOfImageFormats(ncfUInt32 trackNMA, ncfUInt32* numFormats) = 0;  // 3
+    virtual NCFRESULT GetImageFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex,
+                                     ncfUInt32* pixelFormat, ncfUInt32* chromaSubSampling,
+                                     ncfUInt32* componentFormat, ncfUInt32* componentRangeType,
+                                     ncfUInt32* colorSpace, ncfUInt32* fieldOrder,
+                                     ncfUInt32* frameLayout, ncfUInt32* orientation) = 0;  // 4
+    virtual NCFRESULT ImageProviderUnsupportedOperation(ncfUInt32 trackNMA, ncfUInt32,
+                                                        void*) = 0;  // 5
+    // 6. Starts the one reader of all picture tracks anew, unless the format
+    // is the one already chosen.
+    virtual NCFRESULT SetWorkingImageFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex) = 0;
+    virtual NCFRESULT ImageProviderNoOperationA(ncfUInt32 trackNMA, ncfUInt32) = 0;  // 7
+    virtual NCFRESULT ImageProviderNoOperationB(ncfUInt32 trackNMA, float) = 0;      // 8
+    // 9. Size of a frame, or of one field of interlaced material.
+    virtual NCFRESULT GetWorkingImageSize(ncfUInt32 trackNMA, ncfUInt32* width,
+                                          ncfUInt32* height) = 0;
+    // 10. Bytes of a whole frame; the alignment is always 1.
+    virtual NCFRESULT GetWorkingImageBufferRequirements(ncfUInt32 trackNMA,
+                                                        ncfUInt16* bufferStartAlignment,
+                                                        ncfUInt64* maxBufferSize) = 0;
+
+protected:
+    ~IUncompressedImageProvider() = default;
+};
+
+// Formats of sound tracks. The query makes the reader; a failure leaves a
+// pointer to release, as above.
+struct IUncompressedAudioProvider : INCFUnknown {
+    virtual NCFRESULT GetNumberOfAudioFormats(ncfUInt32 trackNMA, ncfUInt32* numFormats) = 0;  // 3
+    virtual NCFRESULT GetAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex,
+                                     ncfUInt32* sampleFormat, ncfUInt16* bytesPerSample,
+                                     ncfUInt16* bitsPerSample) = 0;  // 4
+    virtual NCFRESULT AudioProviderUnsupportedOperation(ncfUInt32 trackNMA, ncfUInt32,
+                                                        void*) = 0;                          // 5
+    virtual NCFRESULT SetWorkingAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex) = 0;  // 6
+
+protected:
+    ~IUncompressedAudioProvider() = default;
+};
+
+// Where the stored samples of a track lie in the file and how they depend on
+// each other. Pictures are numbered in decode order here.
+struct ISampleMapping : INCFUnknown {
+    // 3. The number itself, or a negative failure.
+    virtual ncfSInt32 GetNumberOfTracks() = 0;
+    virtual NCFRESULT GetNumberOfChannels(ncfUInt32 trackNMA, ncfUInt32* numChannels) = 0;  // 4
+    virtual NCFRESULT GetNumberOfSamples(ncfUInt32 trackNMA, ncfUInt64* numSamples) = 0;    // 5
+    virtual NCFRESULT GetSampleStride(ncfUInt32 trackNMA, ncfUInt64, ncfUInt64*) = 0;       // 6
+    // 7. Writes 32 bits, the low half: set the variable to zero first. The
+    // sample number is taken as 32 bits.
+    virtual NCFRESULT GetSampleSize(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                    ncfUInt64* sizeInBytesPtr) = 0;
+    virtual NCFRESULT GetSamplePosition(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                        ncfUInt64* positionInBytes) = 0;  // 8
+    // 9. How many samples further on in decode order lies the one that is
+    // displayed at this sample's place. NCF_E_FAIL when none does, and where a
+    // sample lasts no time at all and yet is displayed elsewhere.
+    virtual NCFRESULT GetSampleTemporalOffset(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                              ncfSInt64* offsetInSamples) = 0;
+    // 10. 1024 with 0 dependencies, 2048 with 1, or 4096 with 2.
+    virtual NCFRESULT GetSampleProperties(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* flagsPtr,
+                                          ncfUInt32* numDependenciesPtr) = 0;
+    virtual NCFRESULT GetSampleDependency(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt32,
+                                          ncfSInt64*) = 0;  // 11
+    // 12 to 18. A unit is one sample.
+    virtual NCFRESULT GetNumberOfEncodedUnits(ncfUInt32 trackNMA, ncfUInt64* numUnits) = 0;
+    virtual NCFRESULT GetEncodedUnitStride(ncfUInt32 trackNMA, ncfUInt64 unit,
+                                           ncfUInt64* stride) = 0;
+    virtual NCFRESULT GetEncodedUnitPosition(ncfUInt32 trackNMA, ncfUInt64 unit,
+                                             ncfUInt64* position) = 0;
+    virtual NCFRESULT GetEncodedUnitSize(ncfUInt32 trackNMA, ncfUInt64 unit, ncfUInt64* size) = 0;
+    virtual NCFRESULT GetEncodedUnitSizeInSamples(ncfUInt32 trackNMA, ncfUInt64 unit,
+                                                  ncfUInt64* sizeInSamples) = 0;
+    virtual NCFRESULT GetEncodedUnitFirstSample(ncfUInt32 trackNMA, ncfUInt64 unit,
+                                                ncfUInt64* sample) = 0;
+    virtual NCFRESULT GetEncodedUnitContainingSample(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                     ncfUInt64* unit) = 0;
+    // 19. Samples from this one on whose bytes follow each other; 1 for every
+    // picture. May answer -1 with success.
+    virtual NCFRESULT GetNumberOfContiguousSamples(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                   ncfSInt64* numSamples) = 0;
+    virtual NCFRESULT GetNumberOfContiguousBytes(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                 ncfUInt64* numBytes) = 0;  // 20
+    virtual NCFRESULT GetNumberOfContiguousEncodedUnits(ncfUInt32 trackNMA, ncfUInt64 unit,
+                                                        ncfSInt64* numUnits) = 0;             // 21
+    virtual NCFRESULT RegisterSampleRangeHint(ncfUInt32 trackNMA, ncfUInt64, ncfUInt64) = 0;  // 22
+    virtual NCFRESULT UnregisterSampleRangeHint(ncfUInt32 trackNMA, ncfUInt64,
+                                                ncfUInt64) = 0;       // 23
+    virtual NCFRESULT SetStorageCallback(INCFUnknown* callback) = 0;  // 24
+
+protected:
+    ~ISampleMapping() = default;
+};
+
+inline constexpr GUID IID_ISampleProvider = ncfGuid("933EEA30-24C0-4733-B51D-E37A811DFFE5");
+inline constexpr GUID IID_IUncompressedImageProvider =
+    ncfGuid("1E1675DC-95E7-45CB-A9F0-7D6326273E70");
+inline constexpr GUID IID_IUncompressedAudioProvider =
+    ncfGuid("6F2EAEF7-2DFD-47B8-AA14-38E4DF57982E");
+inline constexpr GUID IID_ISampleMapping = ncfGuid("E0D63190-0469-4807-92CE-5C22152F84EB");
+constexpr const GUID& ncfIdOf(const ISampleProvider*) {
+    return IID_ISampleProvider;
+}
+constexpr const GUID& ncfIdOf(const IUncompressedImageProvider*) {
+    return IID_IUncompressedImageProvider;
+}
+constexpr const GUID& ncfIdOf(const IUncompressedAudioProvider*) {
+    return IID_IUncompressedAudioProvider;
+}
+constexpr const GUID& ncfIdOf(const ISampleMapping*) {
+    return IID_ISampleMapping;
+}
+
+}  // namespace NMA

@@ -1,0 +1,185 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/quicktime/MovieAtoms.h"
+
+#include <fstream>
+
+namespace host {
+namespace {
+
+constexpr int kDeepest = 8;
+constexpr std::size_t kMostTracks = 65536;
+constexpr ncfUInt32 kMostReferences = 4096;
+
+constexpr ncfUInt32 Code(const char (&text)[5]) {
+    return static_cast<ncfUInt32>(static_cast<unsigned char>(text[0])) << 24 |
+           static_cast<ncfUInt32>(static_cast<unsigned char>(text[1])) << 16 |
+           static_cast<ncfUInt32>(static_cast<unsigned char>(text[2])) << 8 |
+           static_cast<ncfUInt32>(static_cast<unsigned char>(text[3]));
+}
+
+// Walks the atoms that lead to the few numbers wanted and steps over all
+// others, so the cost does not grow with the media.
+class Walker {
+public:
+    Walker(const std::filesystem::path& path, MovieAtoms& out)
+        : stream_(path, std::ios::binary), out_(out) {
+        stream_.seekg(0, std::ios::end);
+        const std::streamoff end = stream_.tellg();
+        length_ = end > 0 ? static_cast<ncfUInt64>(end) : 0;
+    }
+
+    void Run() { Walk(0, length_, 0); }
+
+private:
+    bool Read(ncfUInt64 position, ncfUInt8* to, std::size_t size) {
+        if (size > length_ || position > length_ - size) {
+            return false;
+        }
+        stream_.clear();
+        stream_.seekg(static_cast<std::streamoff>(position));
+        return static_cast<bool>(
+            stream_.read(reinterpret_cast<char*>(to), static_cast<std::streamsize>(size)));
+    }
+    static ncfUInt64 Number(const ncfUInt8* bytes, int count) {
+        ncfUInt64 value = 0;
+        for (int i = 0; i < count; ++i) {
+            value = value << 8 | bytes[i];
+        }
+        return value;
+    }
+
+    void Walk(ncfUInt64 position, ncfUInt64 end, int depth) {
+        ncfUInt8 head[16];
+        while (end - position >= 8 && Read(position, head, 8)) {
+            ncfUInt64 size = Number(head, 4);
+            const ncfUInt32 code = static_cast<ncfUInt32>(Number(head + 4, 4));
+            ncfUInt64 body = 8;
+            if (size == 1 && Read(position, head, 16)) {
+                size = Number(head + 8, 8);
+                body = 16;
+            } else if (size == 0) {
+                size = end - position;
+            }
+            if (size < body || size > end - position) {
+                return;
+            }
+            Visit(code, position + body, position + size, depth);
+            position += size;
+        }
+    }
+
+    void Visit(ncfUInt32 code, ncfUInt64 position, ncfUInt64 end, int depth) {
+        switch (code) {
+            case Code("moof"):
+                out_.isFragmented = out_.isFragmented || depth == 0;
+                return;
+            case Code("trak"):
+                if (out_.tracks.size() < kMostTracks) {
+                    out_.tracks.emplace_back();
+                    Descend(position, end, depth);
+                }
+                return;
+            case Code("moov"):
+            case Code("mdia"):
+            case Code("minf"):
+            case Code("dinf"):
+            case Code("stbl"):
+                Descend(position, end, depth);
+                return;
+            case Code("mvhd"):
+                ReadMovieHeader(position, end);
+                return;
+            case Code("tkhd"):
+                ReadTrackHeader(position, end);
+                return;
+            case Code("stsd"):
+                ReadDescriptions(position, end);
+                return;
+            case Code("dref"):
+                ReadReferences(position, end);
+                return;
+            default:
+                return;
+        }
+    }
+
+    void Descend(ncfUInt64 position, ncfUInt64 end, int depth) {
+        if (depth < kDeepest) {
+            Walk(position, end, depth + 1);
+        }
+    }
+
+    void ReadMovieHeader(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[32];
+        if (end - position < 32 || !Read(position, bytes, sizeof bytes)) {
+            return;
+        }
+        const bool isLong = bytes[0] == 1;
+        out_.timeScale = static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
+        out_.duration = isLong ? Number(bytes + 24, 8) : Number(bytes + 16, 4);
+    }
+
+    void ReadTrackHeader(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[36];
+        if (out_.tracks.empty() || end - position < 36 || !Read(position, bytes, sizeof bytes)) {
+            return;
+        }
+        const bool isLong = bytes[0] == 1;
+        out_.tracks.back().id = static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
+        out_.tracks.back().duration = isLong ? Number(bytes + 28, 8) : Number(bytes + 20, 4);
+    }
+
+    void ReadDescriptions(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[8];
+        if (!out_.tracks.empty() && end - position >= 8 && Read(position, bytes, sizeof bytes)) {
+            // No description is shorter than its own head.
+            const ncfUInt64 most = (end - position - 8) / 16;
+            const ncfUInt64 count = Number(bytes + 4, 4);
+            out_.tracks.back().descriptionCount =
+                static_cast<ncfUInt32>(count < most ? count : most);
+        }
+    }
+
+    // A reference whose lowest flag is set means this very file.
+    void ReadReferences(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[12];
+        position += 8;
+        for (ncfUInt32 i = 0; i < kMostReferences && position < end && end - position >= 12 &&
+                              !out_.tracks.empty() && Read(position, bytes, sizeof bytes);
+             ++i) {
+            if ((bytes[11] & 1) == 0) {
+                out_.tracks.back().needsOtherFiles = true;
+            }
+            const ncfUInt64 size = Number(bytes, 4);
+            if (size < 12) {
+                return;
+            }
+            position += size;
+        }
+    }
+
+    std::ifstream stream_;
+    ncfUInt64 length_ = 0;
+    MovieAtoms& out_;
+};
+
+}  // namespace
+
+const MovieAtoms::Track* MovieAtoms::Find(ncfUInt32 id) const {
+    for (const Track& track : tracks) {
+        if (track.id == id) {
+            return &track;
+        }
+    }
+    return nullptr;
+}
+
+MovieAtoms ReadMovieAtoms(const std::filesystem::path& path) {
+    MovieAtoms atoms;
+    Walker(path, atoms).Run();
+    return atoms;
+}
+
+}  // namespace host

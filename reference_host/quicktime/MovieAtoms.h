@@ -1,0 +1,32 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <vector>
+
+#include "host_interfaces/framework/Types.h"
+
+namespace host {
+
+// What a movie file says of itself that the multimedia library keeps to itself.
+// All of it is optional: files of other families and damaged ones give what
+// could be read.
+struct MovieAtoms {
+    struct Track {
+        ncfUInt32 id = 0;
+        ncfUInt64 duration = 0;  // movie time units
+        ncfUInt32 descriptionCount = 0;
+        bool needsOtherFiles = false;
+    };
+    ncfUInt32 timeScale = 0;  // 0: no movie header was found
+    ncfUInt64 duration = 0;
+    bool isFragmented = false;
+    std::vector<Track> tracks;
+
+    const Track* Find(ncfUInt32 id) const;
+};
+
+MovieAtoms ReadMovieAtoms(const std::filesystem::path& path);
+
+}  // namespace host

@@ -1,0 +1,34 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+#include "reference_host/quicktime/AvOwners.h"
+
+namespace host {
+
+// How a file is opened.
+enum class InputView {
+    AsPresented,  // edit lists applied
+    WholeMedia,   // every stored sample in the order in which it is stored
+};
+
+// Opens a file of any kind that the multimedia library knows. Null with a
+// sentence in `reason` that says what was wrong.
+InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::string& reason);
+
+// Whether the container is of the QuickTime and ISO family.
+bool IsMovieFamily(const AVFormatContext& input);
+
+// Whether the file is one still picture.
+bool IsStillPicture(const AVFormatContext& input);
+
+// Reads on for what the headers left open. May be repeated.
+void FindStreamDetails(AVFormatContext& input);
+
+// Lets the demuxer hand out one stream alone.
+void UseOneStream(AVFormatContext& input, int stream);
+
+}  // namespace host

@@ -1,0 +1,123 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/quicktime/PictureOrder.h"
+
+#include <algorithm>
+
+namespace host {
+namespace {
+
+constexpr std::size_t kNone = static_cast<std::size_t>(-1);
+
+bool HaveDisplayTimes(const std::vector<PacketEntry>& packets) {
+    return std::all_of(packets.begin(), packets.end(), [](const PacketEntry& packet) {
+        return packet.displayTime != AV_NOPTS_VALUE;
+    });
+}
+
+// Some containers give times to some packets alone. Among pictures that are
+// reordered in the plain way, one that others lean on is shown when the next
+// such one is decoded, and any other at once.
+void FillDisplayTimes(std::vector<PacketEntry>& packets) {
+    ncfSInt64 nextReference = AV_NOPTS_VALUE;
+    for (std::size_t i = packets.size(); i-- > 0;) {
+        PacketEntry& packet = packets[i];
+        const bool isMissing = packet.displayTime == AV_NOPTS_VALUE;
+        if (isMissing && packet.decodeTime != AV_NOPTS_VALUE) {
+            packet.displayTime = nextReference != AV_NOPTS_VALUE
+                                     ? nextReference
+                                     : packet.decodeTime + packet.duration;
+        }
+        if (isMissing || packet.displayTime != packet.decodeTime) {
+            nextReference = packet.decodeTime;
+        }
+    }
+}
+
+}  // namespace
+
+PictureOrder::PictureOrder(std::vector<PacketEntry> packets) : packets_(std::move(packets)) {
+    if (!HaveDisplayTimes(packets_)) {
+        FillDisplayTimes(packets_);
+    }
+    pictureOf_.assign(packets_.size(), kNone);
+    for (std::size_t i = 0; i < packets_.size(); ++i) {
+        isIntraOnly_ = isIntraOnly_ && packets_[i].isSync;
+        hasOwnDisplayTimes_ =
+            hasOwnDisplayTimes_ || packets_[i].displayTime != packets_[i].decodeTime;
+        if (packets_[i].isShown) {
+            pictures_.push_back({i, 0});
+        }
+    }
+    hasDisplayTimes_ = HaveDisplayTimes(packets_);
+    if (hasDisplayTimes_) {
+        std::stable_sort(pictures_.begin(), pictures_.end(),
+                         [this](const Picture& a, const Picture& b) {
+                             return packets_[a.packet].displayTime < packets_[b.packet].displayTime;
+                         });
+    }
+    for (std::size_t i = 0; i < pictures_.size(); ++i) {
+        pictureOf_[pictures_[i].packet] = i;
+    }
+    FindStarts();
+}
+
+void PictureOrder::FindStarts() {
+    if (!hasDisplayTimes_) {
+        return;  // pictures are counted, from the first
+    }
+    std::vector<std::size_t> syncBefore(packets_.size(), 0);
+    std::vector<std::size_t> syncs;
+    for (std::size_t i = 0; i < packets_.size(); ++i) {
+        if (packets_[i].isSync) {
+            syncs.push_back(i);
+        }
+        syncBefore[i] = syncs.size();
+    }
+    for (Picture& picture : pictures_) {
+        std::size_t at = syncBefore[picture.packet];
+        const ncfSInt64 shown = packets_[picture.packet].displayTime;
+        while (at > 1 && packets_[syncs[at - 1]].displayTime > shown) {
+            --at;
+        }
+        picture.start = at > 0 ? syncs[at - 1] : 0;
+    }
+}
+
+std::optional<std::size_t> PictureOrder::PictureOfPacket(std::size_t packet) const {
+    if (packet >= pictureOf_.size() || pictureOf_[packet] == kNone) {
+        return std::nullopt;
+    }
+    return pictureOf_[packet];
+}
+
+std::optional<std::size_t> PictureOrder::Find(ncfSInt64 decodeTime, ncfSInt64 displayTime,
+                                              ncfSInt64 position, std::size_t guess) const {
+    const auto agree = [](ncfSInt64 a, ncfSInt64 b, ncfSInt64 unknown) {
+        return a == unknown || b == unknown || a == b;
+    };
+    const auto matches = [&](std::size_t i) {
+        const PacketEntry& packet = packets_[i];
+        if (position >= 0 && packet.position >= 0 && packet.position != position) {
+            return false;
+        }
+        // Times of decoding are guessed by some demuxers, and guessed anew
+        // after a seek.
+        if (hasOwnDisplayTimes_ && displayTime != AV_NOPTS_VALUE) {
+            return packet.displayTime == displayTime;
+        }
+        return agree(decodeTime, packet.decodeTime, AV_NOPTS_VALUE);
+    };
+    for (std::size_t away = 0; away < packets_.size(); ++away) {
+        if (guess + away < packets_.size() && matches(guess + away)) {
+            return guess + away;
+        }
+        if (away > 0 && away <= guess && guess - away < packets_.size() && matches(guess - away)) {
+            return guess - away;
+        }
+    }
+    return std::nullopt;
+}
+
+}  // namespace host

@@ -1,0 +1,221 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/quicktime/PictureReader.h"
+
+#include <algorithm>
+#include <string_view>
+
+#include "reference_host/quicktime/OpenInput.h"
+
+namespace host {
+namespace {
+
+constexpr std::size_t kMostCachedBytes = std::size_t{384} << 20;
+// Going forward, memory that was just used is worth more than pictures that
+// were shown already.
+constexpr std::size_t kKeptForward = 4;
+constexpr std::size_t kKeptBackward = 512;
+// A sync sample this near is reached sooner by decoding on than by seeking.
+constexpr std::size_t kNearPackets = 4;
+
+CodecOwner OpenDecoder(const AVStream& stream) {
+    const AVCodec* const decoder = avcodec_find_decoder(stream.codecpar->codec_id);
+    CodecOwner codec(decoder ? avcodec_alloc_context3(decoder) : nullptr);
+    if (!codec || avcodec_parameters_to_context(codec.get(), stream.codecpar) < 0) {
+        return nullptr;
+    }
+    codec->pkt_timebase = stream.time_base;
+    codec->thread_count = 0;  // as many as there are processors
+    // Near the end of a stream the decoder would keep good pictures back as well;
+    // those that are damaged it marks.
+    codec->flags |= AV_CODEC_FLAG_OUTPUT_CORRUPT;
+    codec->thread_type = FF_THREAD_FRAME | FF_THREAD_SLICE;
+    return avcodec_open2(codec.get(), decoder, nullptr) < 0 ? nullptr : std::move(codec);
+}
+
+// Whether every packet carries its time. Where only some do, or none, a packet
+// reached by a seek can't be told from its neighbours.
+bool TellsTimesOfAll(const AVFormatContext& input) {
+    return (input.iformat->flags & AVFMT_NOTIMESTAMPS) == 0 &&
+           std::string_view(input.iformat->name) != "mpeg";
+}
+
+bool IsDamaged(const AVFrame& frame) {
+    return (frame.flags & AV_FRAME_FLAG_CORRUPT) != 0 || frame.decode_error_flags != 0;
+}
+
+}  // namespace
+
+std::unique_ptr<PictureReader> PictureReader::Open(const std::filesystem::path& path, int stream,
+                                                   bool indexIsWhole) {
+    std::string ignored;
+    InputOwner input = OpenInput(path, InputView::AsPresented, ignored);
+    if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
+        return nullptr;
+    }
+    CodecOwner codec = OpenDecoder(*input->streams[stream]);
+    if (!codec) {
+        return nullptr;
+    }
+    PictureOrder order(ListPackets(*input, stream, indexIsWhole));
+    UseOneStream(*input, stream);
+    return std::unique_ptr<PictureReader>(
+        new PictureReader(path, std::move(input), std::move(codec), stream, std::move(order)));
+}
+
+PictureReader::PictureReader(std::filesystem::path path, InputOwner input, CodecOwner codec,
+                             int stream, PictureOrder order)
+    : path_(std::move(path)),
+      input_(std::move(input)),
+      codec_(std::move(codec)),
+      stream_(stream),
+      order_(std::move(order)),
+      isSeekable_(TellsTimesOfAll(*input_)),
+      cache_(kMostCachedBytes),
+      packet_(av_packet_alloc()) {}
+
+NCFRESULT PictureReader::Read(std::size_t picture, std::shared_ptr<const AVFrame>& frame) {
+    frame = nullptr;
+    if (picture >= order_.PictureCount()) {
+        return NMA_E_NODATA;
+    }
+    const bool goesBack = picture < lastAsked_;
+    lastAsked_ = picture;
+    frame = cache_.Find(picture);
+    if (frame) {
+        return NCF_OK;
+    }
+    mostKept_ = goesBack && !order_.IsIntraOnly() ? kKeptBackward : kKeptForward;
+    if (!MayContinueTo(picture)) {
+        const NCFRESULT started = StartAt(order_.StartFor(picture));
+        if (started < 0) {
+            return started;
+        }
+    }
+    return DecodeUpTo(picture, frame);
+}
+
+bool PictureReader::MayContinueTo(std::size_t picture) const {
+    if (!isRunning_ || (delivered_ > 0 && picture <= lastOut_) ||
+        !order_.IsWholeFrom(picture, runStart_)) {
+        return false;
+    }
+    return !isSeekable_ || order_.StartFor(picture) <= nextPacket_ + kNearPackets;
+}
+
+// Reads the first packet after a seek; keeps it when decoding may start from it.
+bool PictureReader::LandsBefore(std::size_t packet) {
+    while (av_read_frame(input_.get(), packet_.get()) >= 0) {
+        if (packet_->stream_index == stream_) {
+            const auto found = order_.Find(packet_->dts, packet_->pts, packet_->pos, packet);
+            if (found && *found <= packet) {
+                nextPacket_ = *found;
+                isPending_ = true;
+                return true;
+            }
+            av_packet_unref(packet_.get());
+            return false;
+        }
+        av_packet_unref(packet_.get());
+    }
+    return false;
+}
+
+NCFRESULT PictureReader::StartAt(std::size_t packet) {
+    av_packet_unref(packet_.get());
+    isPending_ = false;
+    isRunning_ = false;
+    avcodec_flush_buffers(codec_.get());
+    const PacketEntry& entry = order_.Packet(packet);
+    runStart_ = packet;
+    delivered_ = 0;
+    isRunning_ =
+        isSeekable_ && entry.decodeTime != AV_NOPTS_VALUE &&
+        av_seek_frame(input_.get(), stream_, entry.decodeTime, AVSEEK_FLAG_BACKWARD) >= 0 &&
+        LandsBefore(packet);
+    if (!isRunning_) {  // some files can only be read from their start
+        std::string ignored;
+        if (InputOwner again = OpenInput(path_, InputView::AsPresented, ignored);
+            again && stream_ < static_cast<int>(again->nb_streams)) {
+            input_ = std::move(again);
+            UseOneStream(*input_, stream_);
+            isRunning_ = LandsBefore(packet);
+        }
+    }
+    return isRunning_ ? NCF_OK : NCF_E_FAIL;
+}
+
+// Gives the decoder one more packet, or tells it that there are no more.
+bool PictureReader::Feed() {
+    if (!isPending_ && av_read_frame(input_.get(), packet_.get()) < 0) {
+        return avcodec_send_packet(codec_.get(), nullptr) >= 0;
+    }
+    isPending_ = false;
+    if (packet_->stream_index == stream_) {
+        const std::size_t at = order_.Find(packet_->dts, packet_->pts, packet_->pos, nextPacket_)
+                                   .value_or(nextPacket_);
+        nextPacket_ = at + 1;
+        if (at >= runStart_) {
+            codec_->reordered_opaque = static_cast<ncfSInt64>(at);
+            ++decodedPackets_;
+            // A packet that the decoder refuses leaves its picture out; the
+            // next may be good.
+            avcodec_send_packet(codec_.get(), packet_.get());
+        }
+    }
+    av_packet_unref(packet_.get());
+    return true;
+}
+
+std::optional<std::size_t> PictureReader::PictureOf(const AVFrame& frame) {
+    if (!order_.HasDisplayTimes()) {  // count from the start of the run
+        const auto first = order_.PictureOfPacket(runStart_);
+        return first ? std::optional<std::size_t>(*first + delivered_) : std::nullopt;
+    }
+    return order_.PictureOfPacket(static_cast<std::size_t>(frame.reordered_opaque));
+}
+
+NCFRESULT PictureReader::DecodeUpTo(std::size_t picture, std::shared_ptr<const AVFrame>& out) {
+    for (;;) {
+        FrameOwner frame(av_frame_alloc());
+        if (!frame) {
+            return NCF_E_OUTOFMEMORY;
+        }
+        const int got = avcodec_receive_frame(codec_.get(), frame.get());
+        if (got == AVERROR(EAGAIN)) {
+            if (!Feed()) {
+                isRunning_ = false;
+                return NCF_E_FAIL;
+            }
+            continue;
+        }
+        if (got == AVERROR_EOF) {
+            isRunning_ = false;
+            return NCF_E_FAIL;
+        }
+        if (got < 0) {
+            continue;  // one packet's damage
+        }
+        const auto number = PictureOf(*frame);
+        if (!number || !order_.IsWholeFrom(*number, runStart_)) {
+            continue;
+        }
+        ++delivered_;
+        lastOut_ = *number;
+        std::shared_ptr<const AVFrame> kept;
+        if (!IsDamaged(*frame)) {
+            kept = std::shared_ptr<AVFrame>(frame.release(), FreeFrame());
+            cache_.Keep(*number, kept, picture, mostKept_);
+        }
+        if (*number == picture) {
+            out = std::move(kept);
+            return out ? NCF_OK : NCF_E_FAIL;
+        }
+        if (*number > picture) {
+            return NCF_E_FAIL;
+        }
+    }
+}
+
+}  // namespace host

@@ -1,0 +1,178 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include <numeric>
+#include <optional>
+#include <string_view>
+
+#include "reference_host/framework/Guard.h"
+#include "reference_host/header_parser/ImageAspect.h"
+#include "reference_host/quicktime/CodecPixels.h"
+#include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/QuickTimeWrapper.h"
+
+namespace host {
+namespace {
+
+constexpr ncfUInt32 kTopFieldFirst = 1;
+constexpr ncfUInt32 kFieldsApart = 8;
+// Depth by which sample descriptions say that there is alpha.
+constexpr int kDepthWithAlpha = 32;
+
+bool IsTopFirst(AVFieldOrder order) {
+    return order == AV_FIELD_TT || order == AV_FIELD_TB;
+}
+
+}  // namespace
+
+const AVStream* QuickTimeWrapper::DetailedFirstVideo() const {
+    const ncfUInt32 track = movie_->FirstVideo();
+    return track == 0 ? nullptr : movie_->FindDetailedTrack(track);
+}
+
+NCFRESULT QuickTimeWrapper::QueryVideoDescBufferDetails(ncfUInt32* interlaced, ncfUInt32* bits) {
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    if (!interlaced || !bits) {
+        return NCF_E_POINTER;
+    }
+    return Guarded([&] {
+        const AVStream* const stream = DetailedFirstVideo();
+        if (!stream) {
+            return NCF_E_NOTFOUND;
+        }
+        const AVFieldOrder told = movie_->ContainerFieldOrder(movie_->FirstVideo());
+        const bool isTold = told != AV_FIELD_UNKNOWN;
+        const AVFieldOrder order = isTold ? told : stream->codecpar->field_order;
+        if (order == AV_FIELD_UNKNOWN) {
+            return NMA_E_FIELDS;
+        }
+        *interlaced = order != AV_FIELD_PROGRESSIVE;
+        *bits = 0;
+        if (order != AV_FIELD_PROGRESSIVE) {
+            // Only movie files can say that a sample holds field after field.
+            const bool isApart = isTold && IsMovieFamily(movie_->Input()) &&
+                                 (order == AV_FIELD_TT || order == AV_FIELD_BB);
+            *bits = (IsTopFirst(order) ? kTopFieldFirst : 0) | (isApart ? kFieldsApart : 0);
+        }
+        return NCF_OK;
+    });
+}
+
+ncfBool QuickTimeWrapper::GetFieldLayoutForTrack(ncfUInt32 track, ncfUInt32* fieldCount) {
+    if (!movie_ || !fieldCount || !movie_->IsVideo(track)) {
+        return 0;
+    }
+    AVFieldOrder order = movie_->ContainerFieldOrder(track);
+    if (order == AV_FIELD_UNKNOWN) {
+        order = movie_->FindDetailedTrack(track)->codecpar->field_order;
+    }
+    if (order == AV_FIELD_UNKNOWN) {
+        return 0;
+    }
+    *fieldCount = order == AV_FIELD_PROGRESSIVE ? 1 : 2;
+    return 1;
+}
+
+NCFRESULT QuickTimeWrapper::GetCodecColorSpaceInfo(ncfBool* found709, ncfBool* found601) {
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    if (!found709 || !found601) {
+        return NCF_E_POINTER;
+    }
+    return Guarded([&] {
+        const AVStream* const stream = DetailedFirstVideo();
+        if (!stream) {
+            return NCF_E_NOTFOUND;
+        }
+        const AVColorSpace space = stream->codecpar->color_space;
+        *found709 = space == AVCOL_SPC_BT709 || space == AVCOL_SPC_SMPTE240M;
+        *found601 = space == AVCOL_SPC_BT470BG || space == AVCOL_SPC_SMPTE170M;
+        return NCF_OK;
+    });
+}
+
+ncfBool QuickTimeWrapper::MovieHasOneFrame() {
+    return movie_ && movie_->CountPictures(2) == 1;
+}
+
+NCFRESULT QuickTimeWrapper::MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) {
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    if (!alpha) {
+        return NCF_E_POINTER;
+    }
+    if (kind != QTWrapper::kAlphaCheckForImport && kind != QTWrapper::kAlphaCheckForQTNMA) {
+        return NCF_E_INVALIDARG;
+    }
+    return Guarded([&] {
+        const AVStream* const stream = DetailedFirstVideo();
+        if (!stream) {
+            return NCF_E_NOTFOUND;
+        }
+        const AVCodecParameters& form = *stream->codecpar;
+        bool found = form.codec_id == AV_CODEC_ID_GIF;
+        if (kind == QTWrapper::kAlphaCheckForImport) {
+            found =
+                found || HasAlphaComponent(static_cast<AVPixelFormat>(form.format)) ||
+                (IsMovieFamily(movie_->Input()) && form.bits_per_coded_sample == kDepthWithAlpha);
+        } else if (!found) {
+            std::string ignored;
+            const InputOwner input = OpenInput(movie_->Path(), InputView::AsPresented, ignored);
+            const int index = movie_->StreamOf(movie_->FirstVideo());
+            const FrameOwner frame = input && index < static_cast<int>(input->nb_streams)
+                                         ? DecodeFirstPicture(*input, index)
+                                         : nullptr;
+            found = frame && ShowsAlpha(*frame);
+        }
+        *alpha = found;
+        return NCF_OK;
+    });
+}
+
+NCFRESULT QuickTimeWrapper::GetMovieBox(ncfUInt32* width, ncfUInt32* height, ncfUInt32* aspectNum,
+                                        ncfUInt32* aspectDen) {
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    if (!width || !height) {
+        return NCF_E_POINTER;
+    }
+    const AVStream* const stream = movie_->FindTrack(movie_->FirstVideo());
+    if (!stream || stream->codecpar->width <= 0 || stream->codecpar->height <= 0) {
+        return NCF_E_NOTFOUND;
+    }
+    *width = static_cast<ncfUInt32>(stream->codecpar->width);
+    *height = static_cast<ncfUInt32>(stream->codecpar->height);
+    const AVRational told = stream->sample_aspect_ratio.num > 0
+                                ? stream->sample_aspect_ratio
+                                : stream->codecpar->sample_aspect_ratio;
+    std::optional<header_parser::Ratio> pixel;
+    if (told.num > 0 && told.den > 0) {
+        pixel = header_parser::Ratio{static_cast<ncfUInt32>(told.num),
+                                     static_cast<ncfUInt32>(told.den)};
+    }
+    const header_parser::Ratio aspect =
+        header_parser::ImageAspect(*width, *height, std::nullopt, pixel);
+    if (aspectNum) {
+        *aspectNum = aspect.numerator;
+    }
+    if (aspectDen) {
+        *aspectDen = aspect.denominator;
+    }
+    return NCF_OK;
+}
+
+// Frames come out at their stored size always; a box of no size is a mistake.
+NCFRESULT QuickTimeWrapper::QTWSetMovieBox(ncfSInt16 top, ncfSInt16 left, ncfSInt16 bottom,
+                                           ncfSInt16 right) {
+    if (!movie_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    return bottom == top || right == left ? NCF_E_INVALIDARG : NCF_OK;
+}
+
+}  // namespace host

@@ -1,0 +1,52 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <vector>
+
+#include "host_interfaces/framework/ResultCodes.h"
+#include "reference_host/quicktime/AvOwners.h"
+
+namespace host {
+
+// Decodes one sound track by place: 0 is the first sample that the movie
+// presents, and what an edit leaves empty is silence. Nothing is resampled.
+class SoundDecoder {
+public:
+    static std::unique_ptr<SoundDecoder> Open(const std::filesystem::path& path, int stream);
+
+    int Channels() const { return channels_; }
+
+    // `count` frames from `place`, all channels; `words` holds zeros where there
+    // is no sound. Gives how many frames reach to the last that there is.
+    ncfUInt64 Read(ncfUInt64 place, ncfUInt64 count, std::vector<ncfSInt32>& words);
+
+private:
+    SoundDecoder(InputOwner input, CodecOwner codec, int stream);
+
+    ncfSInt64 TimeOf(ncfSInt64 place) const;
+    ncfSInt64 PlaceOf(ncfSInt64 time) const;
+    void Seek(ncfSInt64 place);
+    bool Advance();  // the next decoded block; false at the end
+    bool Feed();
+
+    InputOwner input_;
+    CodecOwner codec_;
+    FrameOwner frame_;
+    PacketOwner packet_;
+    int stream_;
+    int channels_;
+    ncfSInt64 zeroTime_ = 0;   // of place 0, in time units of the stream
+    ncfSInt64 tolerance_ = 1;  // frames that rounding of times may take
+    bool isRunning_ = false;
+
+    // The block decoded last.
+    std::vector<ncfSInt32> block_;
+    ncfSInt64 blockStart_ = 0;
+    ncfSInt64 blockCount_ = 0;
+    bool isPlaced_ = false;  // the next block follows the last where times agree
+};
+
+}  // namespace host

@@ -1,0 +1,195 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/quicktime/pixels/PictureWriter.h"
+
+#include <algorithm>
+#include <cstring>
+#include <vector>
+
+#include "reference_host/quicktime/pixels/ChromaRows.h"
+#include "reference_host/quicktime/pixels/ColorTransform.h"
+#include "reference_host/quicktime/pixels/DirectPaths.h"
+
+namespace host {
+namespace {
+
+// Lines of plain numbers, each with room for what kernels read beyond it.
+class Rows {
+public:
+    explicit Rows(int width)
+        : stride_((static_cast<std::size_t>(width) + 31) / 16 * 16), values_(stride_ * 8) {}
+    float* operator[](std::size_t i) { return values_.data() + i * stride_; }
+
+private:
+    std::size_t stride_;
+    std::vector<float> values_;
+};
+
+class Writer {
+public:
+    Writer(const AVFrame& frame, const PictureForm& form, PixelLayout layout, std::uint8_t* to)
+        : form_(form),
+          layout_(layout),
+          transform_(TransformFor(form, layout)),
+          reader_(frame, form),
+          chroma_(reader_, form),
+          rows_(form.width),
+          to_(to),
+          lineBytes_(LineBytes(layout, static_cast<ncfUInt32>(form.width))) {
+        std::fill_n(rows_[6], form.width, transform_.opaque);
+    }
+
+    void Run() {
+        const bool isHalf = layout_ == PixelLayout::Uyvy8 || layout_ == PixelLayout::Yuv10;
+        for (int line = 0; line < form_.height; ++line) {
+            isHalf ? WriteHalfChroma(line) : WriteFull(line);
+            to_ += lineBytes_;
+        }
+    }
+
+private:
+    // All three components at full width into rows 0 to 2, as stored.
+    void ReadFull(int line) {
+        reader_.Read(0, line, rows_[0]);
+        if (form_.isRgb) {
+            reader_.Read(1, line, rows_[1]);
+            reader_.Read(2, line, rows_[2]);
+        } else {
+            chroma_.Read(1, line, 0, rows_[1]);
+            chroma_.Read(2, line, 0, rows_[2]);
+        }
+    }
+
+    void Transform() {
+        const float* const in[3] = {rows_[0], rows_[1], rows_[2]};
+        float* const out[3] = {rows_[3], rows_[4], rows_[5]};
+        ApplyAffine(transform_.affine, in, form_.width, out);
+    }
+
+    const float* Alpha(int line) {
+        if (!form_.hasAlpha) {
+            return rows_[6];
+        }
+        reader_.Read(3, line, rows_[7]);
+        ScaleRow(rows_[7], transform_.alphaScale, 0.0f, form_.width, rows_[7]);
+        return rows_[7];
+    }
+
+    void WriteFull(int line) {
+        ReadFull(line);
+        Transform();
+        const float* const out[3] = {rows_[3], rows_[4], rows_[5]};
+        const float* const alpha = Alpha(line);
+        switch (layout_) {
+            case PixelLayout::Argb16:
+                StoreArgb16(out, alpha, form_.width, to_);
+                return;
+            case PixelLayout::AyuvFloat:
+                StoreAyuvFloat(out, alpha, form_.width, to_);
+                return;
+            default:
+                StoreBgra(out, alpha, form_.width, to_);
+                return;
+        }
+    }
+
+    void WriteHalfChroma(int line) {
+        const int half = (form_.width + 1) / 2;
+        if (transform_.keepsChromaApart) {
+            const Affine& k = transform_.affine;
+            reader_.Read(0, line, rows_[0]);
+            ScaleRow(rows_[0], k.m[0][0], k.m[0][3], form_.width, rows_[3]);
+            for (int i = 1; i <= 2; ++i) {
+                chroma_.Read(i, line, 1, rows_[0]);
+                ScaleRow(rows_[0], k.m[i][i], k.m[i][3], half, rows_[3 + i]);
+            }
+            Store(rows_[3], rows_[4], rows_[5]);
+            return;
+        }
+        ReadFull(line);
+        Transform();
+        HalveChroma(rows_[4], form_.width, rows_[0]);
+        HalveChroma(rows_[5], form_.width, rows_[1]);
+        Store(rows_[3], rows_[0], rows_[1]);
+    }
+
+    // The codes at both ends are kept for synchronisation.
+    void Store(const float* luma, const float* cb, const float* cr) {
+        if (layout_ == PixelLayout::Uyvy8) {
+            StoreUyvy(luma, cb, cr, form_.width, 1.0f, 254.0f, to_);
+            return;
+        }
+        const auto width = static_cast<std::size_t>(form_.width);
+        words_.resize(width * 2 + 2);
+        std::uint16_t* const half = words_.data() + width;
+        const int count = (form_.width + 1) / 2;
+        RoundRow(luma, 4.0f, 1019.0f, form_.width, words_.data());
+        RoundRow(cb, 4.0f, 1019.0f, count, half);
+        RoundRow(cr, 4.0f, 1019.0f, count, half + count);
+        StoreV210(words_.data(), half, half + count, form_.width, to_);
+    }
+
+    const PictureForm& form_;
+    PixelLayout layout_;
+    ColorTransform transform_;
+    RowReader reader_;
+    ChromaRows chroma_;
+    Rows rows_;
+    std::vector<std::uint16_t> words_;
+    std::uint8_t* to_;
+    std::size_t lineBytes_;
+};
+
+AVPixelFormat ReadableFormat(AVPixelFormat format) {
+    if (PictureForm::CanRead(format)) {
+        return format;
+    }
+    const AVPixFmtDescriptor* const found = av_pix_fmt_desc_get(format);
+    const bool hasAlpha = found && (found->flags & AV_PIX_FMT_FLAG_ALPHA) != 0;
+    return hasAlpha ? AV_PIX_FMT_RGBA64LE : AV_PIX_FMT_RGB48LE;
+}
+
+// The picture in another format or size by the library's own conversion.
+FrameOwner Reformed(const AVFrame& frame, AVPixelFormat format, int width, int height) {
+    const auto from = static_cast<AVPixelFormat>(frame.format);
+    const ScalerOwner scaler(sws_getContext(frame.width, frame.height, from, width, height, format,
+                                            SWS_BICUBIC | SWS_ACCURATE_RND | SWS_FULL_CHR_H_INT,
+                                            nullptr, nullptr, nullptr));
+    FrameOwner out(av_frame_alloc());
+    if (!scaler || !out || av_frame_copy_props(out.get(), &frame) < 0) {
+        return nullptr;
+    }
+    out->format = format;
+    out->width = width;
+    out->height = height;
+    if (av_frame_get_buffer(out.get(), 0) < 0 ||
+        sws_scale(scaler.get(), frame.data, frame.linesize, 0, frame.height, out->data,
+                  out->linesize) < 0) {
+        return nullptr;
+    }
+    return out;
+}
+
+}  // namespace
+
+bool WritePicture(const AVFrame& frame, PixelLayout layout, ncfUInt32 width, ncfUInt32 height,
+                  std::uint8_t* to) {
+    const auto stored = static_cast<AVPixelFormat>(frame.format);
+    const AVPixelFormat readable = ReadableFormat(stored);
+    const int wantedWidth = static_cast<int>(width);
+    const int wantedHeight = static_cast<int>(height);
+    if (readable != stored || frame.width != wantedWidth || frame.height != wantedHeight) {
+        // A palette can't be scaled; everything else keeps its format.
+        const AVPixelFormat format = readable == AV_PIX_FMT_PAL8 ? AV_PIX_FMT_BGRA : readable;
+        const FrameOwner reformed = Reformed(frame, format, wantedWidth, wantedHeight);
+        return reformed && WritePicture(*reformed, layout, width, height, to);
+    }
+    const PictureForm form(frame);
+    if (!WriteDirectly(frame, form, layout, to)) {
+        Writer(frame, form, layout, to).Run();
+    }
+    return true;
+}
+
+}  // namespace host

@@ -1,0 +1,188 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// The object: creation, the queries with what each prepares, and the
+// operations that start and stop the picture reader or do nothing.
+
+#include "source/essence/QuickTimeSampleMapping.h"
+
+#include "source/clips/LoadMedia.h"
+#include "source/essence/ProviderLock.h"
+#include "source/plugin/CreationFunctions.h"
+#include "source/plugin/InterfaceEntry.h"
+#include "source/plugin/ResultChecks.h"
+
+namespace NMA::Impl {
+namespace {
+
+constexpr GUID kParametersXML = ncfGuid("45FFBAE6-E8F4-48E9-A4A9-1C85BD8D063A");
+
+}  // namespace
+
+NCFRESULT CreateQuickTimeSampleMapping(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
+                                       void** out) {
+    return CreateInstanceOf<QuickTimeSampleMapping>(host, outer, iid, out);
+}
+
+NCFRESULT QuickTimeSampleMapping::InitializeInstance(INCFUnknown* host) {
+    return InterfaceEntry([&] {
+        if (!host) {
+            ThrowIfFailed(NCF_E_POINTER);
+        }
+        ThrowIfFailed(ncfQuery(host, IID_INCFComponentFactory, _pComponentFactory));
+        ThrowIfFailed(ncfCreate(_pComponentFactory.inArg(), CompID_LockComponent, IID_LockComponent,
+                                _providerLock));
+        ThrowIfFailed(ncfQuery(host, IID_INCFConsole, _pConsole));
+        return NCF_OK;
+    });
+}
+
+// --- queries -----------------------------------------------------------------------
+
+// For both providers the reference is handed out before the preparation: when
+// that fails, the caller gets the failure and owns a reference all the same.
+NCFRESULT QuickTimeSampleMapping::InternalQueryInterface(const GUID& iid, void** ppvObj) {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::InternalQueryInterface");
+    if (!ppvObj) {
+        return NCF_E_INVALIDARG;
+    }
+    return InterfaceEntry([&]() -> NCFRESULT {
+        if (ncf_detail::AnswerInterface<ISampleMapping>(this, iid, ppvObj) ||
+            ncf_detail::AnswerInterface<ISampleProvider>(this, iid, ppvObj)) {
+            return NCF_OK;
+        }
+        if (ncf_detail::AnswerInterface<IUncompressedImageProvider>(this, iid, ppvObj)) {
+            return PrepareImageProvider();
+        }
+        if (ncf_detail::AnswerInterface<IUncompressedAudioProvider>(this, iid, ppvObj)) {
+            return PrepareAudioProvider();
+        }
+        if (iid == kParametersXML) {
+            return QueryParametersXML(ppvObj);
+        }
+        return CNCFUnknown::InternalQueryInterface(iid, ppvObj);
+    });
+}
+
+// clang-format off
+// Statements are logged as they stand.
+
+NCFRESULT QuickTimeSampleMapping::PrepareImageProvider() {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::InternalQueryInterface");
+    if (_imageFormatsReady) {
+        return NCF_OK;
+    }
+    const ProviderLock lock(_providerLock);
+    if (!media_) {
+        NCF_RETURN(LoadMedia(_filePath, _pConsole, _pComponentFactory, media_));
+    }
+    NCF_RETURN(AddSupportedImageFormatsBasedOnCodec());
+    return NCF_OK;
+}
+
+NCFRESULT QuickTimeSampleMapping::PrepareAudioProvider() {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::InternalQueryInterface");
+    if (_audioReaderHolder) {
+        return NCF_OK;
+    }
+    if (!media_) {
+        NCF_RETURN(LoadMedia(_filePath, _pConsole, _pComponentFactory, media_));
+    }
+    NCF_RETURN(media_->GetQuickTimeAudioReader(_audioReaderHolder));
+    return NCF_OK;
+}
+
+// The per-clip parameters have no component yet: their interface is answered
+// like any that is unknown.
+NCFRESULT QuickTimeSampleMapping::QueryParametersXML(void** ppvObj) {
+    *ppvObj = nullptr;
+    return NCF_E_NOINTERFACE;
+}
+
+// --- what the container and the parameters call ---------------------------------------
+
+NCFRESULT QuickTimeSampleMapping::SetFilePath(NCFSmartPtr<INCFString> path) {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::SetFilePath");
+    _filePath = path;
+    NCF_RETURN(_filePath->ConvertTo(kNCFUTF16));
+    return NCF_OK;
+}
+
+NCFRESULT QuickTimeSampleMapping::SetMediaContainer(std::tr1::shared_ptr<BaseClip> media) {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::SetMediaContainer");
+    CHK_INARG(media);
+    media_ = media;
+    (void)InitializeMediaTracks(media);
+    return NCF_OK;
+}
+
+NCFRESULT QuickTimeSampleMapping::RefreshBasedOnUIParams() {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::RefreshBasedOnUIParams");
+    const ProviderLock lock(_providerLock);
+    if (!media_) {
+        return NMA_E_NOTINITIALIZED;
+    }
+    // The fields matter even where no format came of the change.
+    if (_imageFormatsReady) {
+        (void)AddDecompressorPixelFormats(FirstTrackOf(MediaTrack::kVideo), FirstAlphaTrackShown());
+    } else {
+        (void)AddSupportedImageFormatsBasedOnCodec();
+    }
+    NCF_RETURN(media_->SetFieldLayoutDetails());
+    return NCF_OK;
+}
+
+// --- starting and stopping --------------------------------------------------------------
+
+NCFRESULT QuickTimeSampleMapping::SetupOrCleanup(ncfUInt32 trackNMA, bool setup) {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::SetupOrCleanup");
+    std::tr1::shared_ptr<MediaTrack> track;
+    NCF_RETURN(GetMediaTrack(trackNMA, track));
+    if (!IsPictureTrack(*track) || !_videoReaderHolder) {
+        return NCF_OK;
+    }
+    if (setup) {
+        if (!media_) {
+            NCF_RETURN(LoadMedia(_filePath, _pConsole, _pComponentFactory, media_));
+        }
+        NCF_RETURN(_videoReaderHolder->InitQT(QTWrapper::kUseDecompressionSession));
+    } else {
+        NCF_RETURN(_videoReaderHolder->ReleaseQT());
+    }
+    return NCF_OK;
+}
+// clang-format on
+
+NCFRESULT QuickTimeSampleMapping::Setup(ncfUInt32 trackNMA) {
+    return InterfaceEntry([&] { return SetupOrCleanup(trackNMA, true); });
+}
+
+NCFRESULT QuickTimeSampleMapping::Cleanup(ncfUInt32 trackNMA) {
+    return InterfaceEntry([&] { return SetupOrCleanup(trackNMA, false); });
+}
+
+// --- refused, and nothing to do -----------------------------------------------------------
+
+NCFRESULT QuickTimeSampleMapping::ProviderUnsupportedOperation(ncfUInt32, ncfUInt64, ncfUInt64) {
+    return NCF_E_NOTIMPL;
+}
+NCFRESULT QuickTimeSampleMapping::ProviderNoOperationA(ncfUInt32, ncfUInt64, ncfUInt64) {
+    return NCF_OK;
+}
+NCFRESULT QuickTimeSampleMapping::ProviderNoOperationB() {
+    return NCF_OK;
+}
+NCFRESULT QuickTimeSampleMapping::ImageProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) {
+    return NCF_E_NOTIMPL;
+}
+NCFRESULT QuickTimeSampleMapping::ImageProviderNoOperationA(ncfUInt32, ncfUInt32) {
+    return NCF_OK;
+}
+NCFRESULT QuickTimeSampleMapping::ImageProviderNoOperationB(ncfUInt32, float) {
+    return NCF_OK;
+}
+NCFRESULT QuickTimeSampleMapping::AudioProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) {
+    return NCF_E_NOTIMPL;
+}
+
+}  // namespace NMA::Impl

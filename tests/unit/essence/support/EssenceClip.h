@@ -1,0 +1,227 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <map>
+#include <string>
+#include <vector>
+
+#include "source/clips/BaseClip.h"
+#include "tests/support/fakes/FakeHost.h"
+#include "tests/support/fakes/parser/FakeCalls.h"
+
+// One track of a fake clip with its samples.
+struct EssenceTrack {
+    ncfUInt32 qtTrack = 0;
+    std::vector<ncfSInt64> displayOffsets;
+    ncfSInt64 duration = 1000;
+    ncfUInt64 firstOffset = 5000;
+    ncfUInt32 size = 100;  // sample n has size + n bytes
+    ncfUInt32 flags = 1;
+    ncfUInt64 next = 0;  // what the run of any sample ends before
+    NCFRESULT nextResult = NCF_OK;
+};
+
+// A clip that answers what a test sets: writes "clip.<operation> <arguments>"
+// into the journal and fails the operations named in `results`.
+class EssenceClip final : public BaseClip, public FakeCalls {
+public:
+    EssenceClip(FakeHost& host, Journal* lines)
+        : BaseClip(Text("/movies/a.mov"), NCFSmartPtr<INCFConsole>(&host.console()),
+                   NCFSmartPtr<INCFComponentFactory>(host.factory())),
+          FakeCalls("clip", lines) {
+        loaded_ = 1;
+        width_ = 1920;
+        height_ = 1080;
+        temporalFieldOrder_ = kProgressive;
+        frameBufferLayout_ = kLayoutMerged;
+        colorSpace_ = CS_YCbCr_709;
+        ignoreAlpha_ = 0;
+    }
+
+    std::vector<EssenceTrack> video;
+    std::vector<EssenceTrack> audio;
+    ncfUInt32 trackCount = 0;
+    ncfBool oneFrame = 0;
+    ncfBool multiFormat = 0;
+    AudioTrackMetadata metadata = {2, 48000.0, kFormatLPCM, 4, 16, 0, 1};
+
+    void setAlpha(bool alpha) { hasAlpha_ = alpha; }
+    void setIgnoreAlpha(bool ignore) { ignoreAlpha_ = ignore; }
+    void setSize(ncfUInt32 width, ncfUInt32 height) {
+        width_ = width;
+        height_ = height;
+    }
+    void setColorSpace(ncfUInt32 space) { colorSpace_ = space; }
+    void setFieldOrder(ncfUInt32 order) { temporalFieldOrder_ = order; }
+    void setLayout(ncfUInt32 layout) { frameBufferLayout_ = layout; }
+    void setOrientation(ncfUInt32 orientation) { bufferLineOrientation_ = orientation; }
+    void setLevels(ncfUInt32 levels) { clipParams_.levelRemap = levels; }
+
+    NCFRESULT SetFieldLayoutDetails() override { return enter("SetFieldLayoutDetails"); }
+    NCFRESULT GetTrackCount(ncfUInt32* out) override {
+        return give("GetTrackCount", out, trackCount);
+    }
+    NCFRESULT GetVideoTrackQTId(ncfUInt32 track, ncfUInt32& out) override {
+        return give("GetVideoTrackQTId", &out, video.at(track).qtTrack);
+    }
+    NCFRESULT GetAudioTrackQTId(ncfUInt32 track, ncfUInt32& out) override {
+        return give("GetAudioTrackQTId", &out, audio.at(track).qtTrack);
+    }
+    NCFRESULT GetTrackType(ncfUInt32 qtTrack, ncfUInt32* out) override {
+        ncfUInt32 type = kTrackAudio;
+        for (const EssenceTrack& track : video) {
+            type = track.qtTrack == qtTrack ? kTrackVideo : type;
+        }
+        return give("GetTrackType", out, type);
+    }
+    NCFRESULT GetAudioTrackMetadata(ncfUInt32, AudioTrackMetadata* out) override {
+        return give("GetAudioTrackMetadata", out, metadata);
+    }
+    NCFRESULT HasOneFrame(ncfBool* out) override { return give("HasOneFrame", out, oneFrame); }
+    NCFRESULT IsMultiFormatMovie(ncfBool* out) override {
+        return give("IsMultiFormatMovie", out, multiFormat);
+    }
+    NCFRESULT GetVideoTrackCountImpl(ncfUInt32* out) override {
+        return give("GetVideoTrackCount", out, video.size());
+    }
+    NCFRESULT GetAudioTrackCountImpl(ncfUInt32* out) override {
+        return give("GetAudioTrackCount", out, audio.size());
+    }
+    NCFRESULT GetEncodedWidthAndHeight(ncfUInt32* width, ncfUInt32* height) override {
+        const NCFRESULT result = give("GetEncodedWidthAndHeight", width, width_);
+        if (result >= 0) {
+            *height = height_;
+        }
+        return result;
+    }
+    NCFRESULT GetColorSpace(ncfUInt32* out) const override {
+        const NCFRESULT result = resultOf("GetColorSpace");
+        return result < 0 ? result : BaseClip::GetColorSpace(out);
+    }
+    NCFRESULT GetTemporalFieldOrder(ncfUInt32* out) const override {
+        journal->add("clip.GetTemporalFieldOrder");
+        const NCFRESULT result = resultOf("GetTemporalFieldOrder");
+        return result < 0 ? result : BaseClip::GetTemporalFieldOrder(out);
+    }
+    NCFRESULT GetBufferLineOrientation(ncfUInt32* out) const override {
+        journal->add("clip.GetBufferLineOrientation");
+        const NCFRESULT result = resultOf("GetBufferLineOrientation");
+        return result < 0 ? result : BaseClip::GetBufferLineOrientation(out);
+    }
+    NCFRESULT GetFrameBufferLayout(ncfUInt32* out) const override {
+        journal->add("clip.GetFrameBufferLayout");
+        const NCFRESULT result = resultOf("GetFrameBufferLayout");
+        return result < 0 ? result : BaseClip::GetFrameBufferLayout(out);
+    }
+
+    // --- samples, counted from one -------------------------------------------------
+    NCFRESULT GetNumSamples(ncfUInt32 qtTrack, ncfUInt64* out) override {
+        return give("GetNumSamples", out, trackOf(qtTrack).displayOffsets.size());
+    }
+    NCFRESULT GetDataOffset(ncfUInt32 qtTrack, ncfUInt64 sample, ncfUInt64* out) override {
+        return ask("GetDataOffset", qtTrack, sample, out,
+                   trackOf(qtTrack).firstOffset + 1000 * sample);
+    }
+    NCFRESULT GetSampleFlags(ncfUInt32 qtTrack, ncfUInt64 sample, ncfUInt32* out) override {
+        return ask("GetSampleFlags", qtTrack, sample, out, trackOf(qtTrack).flags);
+    }
+    NCFRESULT GetNextDiscontiguousDataAttributeChange(ncfUInt32 qtTrack, ncfUInt64 sample,
+                                                      ncfUInt64* out) override {
+        const EssenceTrack& track = trackOf(qtTrack);
+        note("GetNextDiscontiguousDataAttributeChange", qtTrack, sample);
+        if (track.nextResult >= 0) {
+            *out = track.next;
+        }
+        return track.nextResult;
+    }
+    NCFRESULT GetDataSizePerSample(ncfUInt32 qtTrack, ncfUInt64 sample, ncfUInt32* out) override {
+        return ask("GetDataSizePerSample", qtTrack, sample, out, trackOf(qtTrack).size + sample);
+    }
+    NCFRESULT GetDisplayOffset(ncfUInt32 qtTrack, ncfUInt64 sample, ncfSInt64* out) override {
+        const std::vector<ncfSInt64>& offsets = trackOf(qtTrack).displayOffsets;
+        note("GetDisplayOffset", qtTrack, sample);
+        if (sample < 1 || sample > offsets.size()) {
+            return NCF_E_INVALIDARG;
+        }
+        const NCFRESULT result = resultOf("GetDisplayOffset");
+        if (result >= 0) {
+            *out = offsets[sample - 1];
+        }
+        return result;
+    }
+    NCFRESULT GetDecodeDuration(ncfUInt32 qtTrack, ncfUInt64 sample, ncfSInt64* out) override {
+        return ask("GetDecodeDuration", qtTrack, sample, out, trackOf(qtTrack).duration);
+    }
+
+    // --- nobody here asks these --------------------------------------------------------
+    NCFRESULT GetNMAFrameLayout(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetDataFormat(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetVendor(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetNivoResolution(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetTimecodeTrackQTId(ncfUInt32, ncfUInt32&) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetTimeCodeTrackMetadata(ncfUInt32, TimeCodeTrackMetadata*) override {
+        return NCF_E_NOTIMPL;
+    }
+    NCFRESULT IsAudioLPCM(ncfUInt32, ncfBool*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetEditRate(Rational*) const override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetMovieLength(ncfUInt64*) const override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetCreationTime(ncfUInt64*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetCodecName(ncfUInt32, NCFSmartPtr<INCFString>&) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetContentForHash(std::vector<ncfUInt8>&) override { return NCF_E_NOTIMPL; }
+    NCFRESULT IsSelfContained() override { return NCF_E_NOTIMPL; }
+    NCFRESULT IsVideoSampleProviderMedia(AAFInfo*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetMaxDataSizeInBytes(ncfUInt32, ncfUInt32*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetHasOutOfOrderFrameDependencies(ncfUInt32, ncfBool*) override {
+        return NCF_E_NOTIMPL;
+    }
+    NCFRESULT LoadClipImpl() override { return NCF_E_NOTIMPL; }
+    NCFRESULT SetColorSpaceImpl() override { return NCF_E_NOTIMPL; }
+    NCFRESULT SetGeometryImpl() override { return NCF_E_NOTIMPL; }
+    NCFRESULT SetEditRateImpl(const EditorSettings&) override { return NCF_E_NOTIMPL; }
+    NCFRESULT SetMovieLengthImpl(const EditorSettings&) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetEncodedWidthAndHeightImpl(ncfUInt32*, ncfUInt32*) override {
+        return NCF_E_NOTIMPL;
+    }
+    NCFRESULT GetImageAspectRatioImpl(ncfUInt32*, ncfUInt32*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetTimeCodeTrackCountImpl(ncfUInt32*) override { return NCF_E_NOTIMPL; }
+    NCFRESULT CalculateAudioTrackLengthInSamples(ncfUInt32, ncfUInt64*) override {
+        return NCF_E_NOTIMPL;
+    }
+
+private:
+    static NCFSmartPtr<INCFString> Text(const std::string& text) {
+        NCFSmartPtr<INCFString> string;
+        string.attach(MakeHostString(text));
+        return string;
+    }
+    const EssenceTrack& trackOf(ncfUInt32 qtTrack) const {
+        for (const auto* list : {&video, &audio}) {
+            for (const EssenceTrack& track : *list) {
+                if (track.qtTrack == qtTrack) {
+                    return track;
+                }
+            }
+        }
+        static const EssenceTrack none;
+        return none;
+    }
+    NCFRESULT resultOf(const std::string& operation) const {
+        const auto found = results.find(operation);
+        return found == results.end() ? NCF_OK : found->second;
+    }
+    void note(const std::string& operation, ncfUInt32 qtTrack, ncfUInt64 sample) {
+        journal->add("clip." + operation + " " + std::to_string(qtTrack) + " " +
+                     std::to_string(static_cast<ncfSInt64>(sample)));
+    }
+    template <class Out, class Value>
+    NCFRESULT ask(const std::string& operation, ncfUInt32 qtTrack, ncfUInt64 sample, Out* out,
+                  const Value& value) {
+        note(operation, qtTrack, sample);
+        const NCFRESULT result = resultOf(operation);
+        if (result >= 0) {
+            *out = static_cast<Out>(value);
+        }
+        return result;
+    }
+};

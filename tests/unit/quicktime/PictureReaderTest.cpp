@@ -1,0 +1,81 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <gtest/gtest.h>
+
+#include "reference_host/quicktime/PictureReader.h"
+#include "tests/unit/quicktime/MadeMovie.h"
+
+using namespace quicktime_tests;
+
+namespace {
+
+std::unique_ptr<host::PictureReader> Open(const MadeMovie& movie) {
+    return host::PictureReader::Open(movie.Path(), 0, true);
+}
+
+// Decoders look ahead by their threads and their reordering.
+constexpr ncfUInt64 kAhead = 80;
+
+TEST(PictureReader, DecodesEachPacketOnceGoingForward) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=8 -c:v libx264 -bf 2 -g 50");
+    const auto reader = Open(movie);
+    ASSERT_TRUE(reader);
+    std::shared_ptr<const AVFrame> frame;
+    for (std::size_t i = 0; i < 200; ++i) {
+        ASSERT_EQ(reader->Read(i, frame), NCF_OK);
+    }
+    EXPECT_EQ(reader->DecodedPackets(), 200u);
+}
+
+TEST(PictureReader, DecodesAGroupOnceForStepsBackWithinIt) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=8 -c:v libx264 -bf 2 -g 200");
+    const auto reader = Open(movie);
+    ASSERT_TRUE(reader);
+    std::shared_ptr<const AVFrame> frame;
+    ASSERT_EQ(reader->Read(150, frame), NCF_OK);
+    const ncfUInt64 before = reader->DecodedPackets();
+    for (std::size_t i = 150; i-- > 0;) {
+        ASSERT_EQ(reader->Read(i, frame), NCF_OK);
+    }
+    EXPECT_LE(reader->DecodedPackets() - before, 150 + kAhead);
+}
+
+TEST(PictureReader, JumpsToTheNearestSyncSample) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie(
+        "-f lavfi -i testsrc2=s=64x48:r=25:d=20 -c:v libx264 -bf 2 -g 25 -threads 1");
+    const auto reader = Open(movie);
+    ASSERT_TRUE(reader);
+    std::shared_ptr<const AVFrame> frame;
+    ASSERT_EQ(reader->Read(455, frame), NCF_OK);
+    EXPECT_LE(reader->DecodedPackets(), 6 + kAhead);
+    EXPECT_EQ(reader->Read(500, frame), NMA_E_NODATA);
+    EXPECT_FALSE(frame);
+}
+
+TEST(PictureCache, KeepsThoseNearestWithinItsMemory) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=1 -c:v prores_ks");
+    const auto reader = Open(movie);
+    std::shared_ptr<const AVFrame> frame;
+    ASSERT_EQ(reader->Read(0, frame), NCF_OK);
+    host::PictureCache one(std::size_t{1} << 30);
+    one.Keep(0, frame, 0, 10);
+    const std::size_t bytes = one.Bytes();
+    ASSERT_GT(bytes, 0u);
+    host::PictureCache cache(bytes * 3);
+    for (std::size_t i = 0; i < 20; ++i) {
+        cache.Keep(i, frame, 10, 100);
+        EXPECT_LE(cache.Bytes(), bytes * 3);
+    }
+    EXPECT_TRUE(cache.Find(10));
+    EXPECT_FALSE(cache.Find(0));
+    cache.Keep(10, frame, 10, 1);
+    EXPECT_EQ(cache.Count(), 1u);
+    cache.Clear();
+    EXPECT_EQ(cache.Bytes(), 0u);
+}
+
+}  // namespace
