@@ -13,7 +13,9 @@ DescriptionDouble descriptionDouble;
 struct NMAVolume::State {};
 
 NMAVolume::NMAVolume(INCFString*) : state_(nullptr) {}
-NMAVolume::~NMAVolume() = default;
+NMAVolume::~NMAVolume() {
+    delete state_;
+}
 
 INCFString* NMAVolume::GetFirstFile(const char* pattern, void*& handle) {
     volumeDouble.patterns.push_back(pattern);
