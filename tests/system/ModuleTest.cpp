@@ -7,6 +7,7 @@
 #include <cstdio>
 #include <memory>
 
+#include "host_interfaces/media/SampleMapping.h"
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/MediaVolume.h"
 #include "host_interfaces/media/PluginComponents.h"
@@ -67,7 +68,7 @@ struct ComponentRow {
     bool hasFactory;
 };
 
-// The two that wait for their subsystem have no factory yet; registered clips
+// The one that waits for its subsystem has no factory yet; registered clips
 // never have one.
 constexpr ComponentRow kComponents[] = {
     {"QuickTimeMediaVolume", ncfGuid("A0529DD3-C63D-45EA-AF2A-D962C0DFB5B5"),
@@ -81,7 +82,7 @@ constexpr ComponentRow kComponents[] = {
     {"QuickTimeMediaContainer", ncfGuid("781F84B7-B989-4534-8A07-C595CB9A6FB8"),
      ncfGuid("058B2AEF-CC2F-4652-B8A0-28D773A8DFB1"), 3, true},
     {"QuickTimeSampleMapping", ncfGuid("0E74B673-0CA8-403B-A142-986D79508637"),
-     ncfGuid("109B6222-FDAE-42AB-9E1C-A547123901A0"), 3, false},
+     ncfGuid("109B6222-FDAE-42AB-9E1C-A547123901A0"), 3, true},
     {"QuickTimeClips", ncfGuid("C7D2D55A-0A1A-44B3-A7D3-5D78EC80FAD8"),
      ncfGuid("C5D1D369-62EF-46F8-84B8-1700F1153100"), 3, false},
     {"GenericDocumentHandler", ncfGuid("4E40C813-86AD-4275-92CC-3AAB04EB1689"),
@@ -171,16 +172,14 @@ TEST_F(Module, IsLoadedAndUnloadedAgainAndAgain) {
     }
 }
 
-// The sample mapping and the clip's parameters come later: a plain failure, and
-// nothing that pretends.
-TEST_F(Module, HasNoSampleMappingYet) {
+TEST_F(Module, ServesASampleMappingOfAMovie) {
     host::Ref<NMA::IMediaContainer3> container;
     ASSERT_EQ(session().host().Create(NMA::CompID_QuickTimeContainer, container), NCF_OK);
     const auto path = cliphost::PathForModule(MadeMovie("png.mov"));
     ASSERT_EQ(container->SetFilePath(path.get()), NCF_OK);
-    ISampleMapping* mapping = nullptr;
-    EXPECT_LT(container->GetSampleMapping(&mapping), 0);
-    EXPECT_EQ(mapping, nullptr);
+    host::Ref<NMA::ISampleMapping> mapping;
+    EXPECT_EQ(container->GetSampleMapping(mapping.Out()), NCF_OK);
+    EXPECT_TRUE(mapping);
 }
 
 }  // namespace

@@ -26,6 +26,7 @@
 #include "host_interfaces/header_parser/TrackInfo.h"
 #include "host_interfaces/media/AAFClips.h"
 #include "host_interfaces/media/MediaContainer.h"
+#include "host_interfaces/media/SampleMapping.h"
 #include "host_interfaces/media/MediaVolume.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/media/Sequences.h"
@@ -83,7 +84,7 @@ const IdRow kIds[] = {
     {"IID_IMediaContainer", NMA::IID_IMediaContainer, "51092B47-F81C-46E3-B9AB-376705C79F12"},
     {"IID_IMediaContainer2", NMA::IID_IMediaContainer2, "5FEB3C83-08DF-4CCC-A9F4-083EEA2A1DAB"},
     {"IID_IMediaContainer3", NMA::IID_IMediaContainer3, "13B79A3E-6A3E-45E3-B9F6-E516CA4DF372"},
-    {"IID_ISampleMapping", IID_ISampleMapping, "E0D63190-0469-4807-92CE-5C22152F84EB"},
+    {"IID_ISampleMapping", NMA::IID_ISampleMapping, "E0D63190-0469-4807-92CE-5C22152F84EB"},
     {"IID_IVolumeInfo", NMA::IID_IVolumeInfo, "50DC91ED-F177-4C09-A1A3-DAC626AC27FE"},
     {"IID_IVolumeInfo2", NMA::IID_IVolumeInfo2, "E8DB7522-4A6B-45CE-ACD5-3DF3D6D5FDF4"},
     {"IID_IMediaFormat", NMA::IID_IMediaFormat, "BE697E45-A0CD-4EBC-A21C-FA3652220D60"},

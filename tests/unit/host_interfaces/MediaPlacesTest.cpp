@@ -31,7 +31,7 @@ struct PlacesIMediaContainer3 : PlaceFake<NMA::IMediaContainer3> {
     NCFRESULT ContainerUnsupportedA(void*, void*, void*) override { return Ran<NCFRESULT>("ContainerUnsupportedA"); }
     NCFRESULT GetAAFMasterClips(NMA::IAAFClips**) override { return Ran<NCFRESULT>("GetAAFMasterClips"); }
     NCFRESULT SetFilePath(INCFString*) override { return Ran<NCFRESULT>("SetFilePath"); }
-    NCFRESULT GetSampleMapping(ISampleMapping**) override { return Ran<NCFRESULT>("GetSampleMapping"); }
+    NCFRESULT GetSampleMapping(NMA::ISampleMapping**) override { return Ran<NCFRESULT>("GetSampleMapping"); }
     NCFRESULT ContainerUnsupportedB(void*) override { return Ran<NCFRESULT>("ContainerUnsupportedB"); }
     NCFRESULT GetCapabilities(ncfUInt32*) override { return Ran<NCFRESULT>("GetCapabilities"); }
     ncfUInt32 GetFileTypeCount() override { return Ran<ncfUInt32>("GetFileTypeCount"); }
