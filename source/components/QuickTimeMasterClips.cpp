@@ -8,9 +8,9 @@
 #include "source/aaf/NewAAFFromMovie.h"
 #include "source/clips/LoadMedia.h"
 #include "source/components/HostServices.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/components/MoviePattern.h"
 #include "source/plugin/CreationFunctions.h"
+#include "source/plugin/InterfaceEntry.h"
 
 namespace NMA::Impl {
 

@@ -5,9 +5,9 @@
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/components/HostServices.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/components/QuickTimeMasterClips.h"
 #include "source/plugin/CreationFunctions.h"
+#include "source/plugin/InterfaceEntry.h"
 
 namespace NMA::Impl {
 

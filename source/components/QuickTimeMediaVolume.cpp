@@ -6,11 +6,11 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/util/NMAVolume.h"
 #include "source/components/HostServices.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/components/MoviePattern.h"
 #include "source/components/QuickTimeMediaFormat.h"
 #include "source/components/QuickTimeVolumeInfo.h"
 #include "source/plugin/CreationFunctions.h"
+#include "source/plugin/InterfaceEntry.h"
 
 namespace NMA::Impl {
 namespace {

@@ -7,9 +7,9 @@
 #include <string>
 
 #include "host_interfaces/util/NMAVolume.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/components/MoviePattern.h"
 #include "source/plugin/CreationFunctions.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/NCFSmartPtr.h"
 #include "source/plugin/ResultChecks.h"
 

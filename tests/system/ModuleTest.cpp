@@ -7,10 +7,10 @@
 #include <cstdio>
 #include <memory>
 
-#include "host_interfaces/media/SampleMapping.h"
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/MediaVolume.h"
 #include "host_interfaces/media/PluginComponents.h"
+#include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/util/text/HostText.h"
 #include "tests/system/SystemTest.h"
 
