@@ -2,20 +2,49 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/HeaderBytes.h"
 
+#include <sys/mman.h>
+
 #include <algorithm>
+#include <cstdint>
 #include <cstring>
 
 namespace header_parser {
 
+namespace {
+
+constexpr ncfUInt64 kLargePage = ncfUInt64{2} << 20;
+
+// Page by page, a block of a hundred megabytes costs more to touch than to
+// parse; the hint lets the system back it with large pages.
+void ExpectLargeBlock(ncfUInt8* memory, ncfUInt64 bytes) {
+#ifdef MADV_HUGEPAGE
+    const auto begin = reinterpret_cast<std::uintptr_t>(memory);
+    const std::uintptr_t first = (begin + kLargePage - 1) / kLargePage * kLargePage;
+    const std::uintptr_t end = (begin + bytes) / kLargePage * kLargePage;
+    if (first < end) {
+        madvise(reinterpret_cast<void*>(first), end - first, MADV_HUGEPAGE);
+    }
+#endif
+}
+
+}  // namespace
+
+ncfUInt64 HeaderBytes::NextCapacity(ncfUInt64 needed) const {
+    return std::max({needed, size_ * 2, std::min(expected_, size_ * 16)});
+}
+
 ncfUInt8* HeaderBytes::Room(ncfUInt64 count) {
     if (count > capacity_ - size_) {
-        const ncfUInt64 wanted = std::max(size_ + count, size_ * 2);
-        void* moved = std::realloc(bytes_.get(), static_cast<std::size_t>(wanted));
-        if (moved == nullptr) {
+        const ncfUInt64 wanted = NextCapacity(size_ + count);
+        auto* const larger = static_cast<ncfUInt8*>(std::malloc(static_cast<std::size_t>(wanted)));
+        if (larger == nullptr) {
             return nullptr;
         }
-        static_cast<void>(bytes_.release());
-        bytes_.reset(static_cast<ncfUInt8*>(moved));
+        ExpectLargeBlock(larger, wanted);
+        if (size_ > 0) {
+            std::memcpy(larger, bytes_.get(), static_cast<std::size_t>(size_));
+        }
+        bytes_.reset(larger);
         capacity_ = wanted;
     }
     return bytes_.get() + size_;

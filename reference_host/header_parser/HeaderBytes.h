@@ -11,14 +11,16 @@ namespace header_parser {
 
 // The bytes of the movie header, gathered piece by piece and kept once. The
 // tables are read in place, so nothing is appended any more once they are in
-// use. Grows by reallocation, which moves large blocks without a copy, and
-// never takes more than twice what was really given.
+// use. A large header grows in few steps, towards what its atom claims but
+// never past sixteen times what was really given.
 class HeaderBytes {
 public:
     const ncfUInt8* begin() const { return bytes_.get(); }
     const ncfUInt8* end() const { return bytes_.get() + size_; }
     ncfUInt64 Size() const { return size_; }
 
+    // How many bytes there will be, as far as the file can be trusted.
+    void Expect(ncfUInt64 size) { expected_ = size; }
     // False without memory; the bytes so far stay.
     bool Append(const ncfUInt8* from, ncfUInt64 count);
     void Shorten(ncfUInt64 size) { size_ = size; }
@@ -31,7 +33,10 @@ private:
         void operator()(ncfUInt8* bytes) const { std::free(bytes); }
     };
 
+    ncfUInt64 NextCapacity(ncfUInt64 needed) const;
+
     std::unique_ptr<ncfUInt8, Free> bytes_;
+    ncfUInt64 expected_ = 0;
     ncfUInt64 size_ = 0;
     ncfUInt64 capacity_ = 0;
 };

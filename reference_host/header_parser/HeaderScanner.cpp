@@ -148,6 +148,7 @@ Verdict HeaderScanner::EnterHeader(ncfUInt64 size, ncfUInt64 headerSize, bool to
     if (!toEnd && size > limits_.maxHeaderBytes) {
         return TooMuch("the movie header is too large");
     }
+    payload_.Expect(toEnd ? 0 : size - headerSize);
     return Fine();
 }
 

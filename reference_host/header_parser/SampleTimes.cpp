@@ -148,28 +148,38 @@ template <typename Visit>
 void SampleTimes::ForEachStretch(ncfUInt32 sample, Visit visit) const {
     DurationRun decode = DurationRunOf(sample);
     OffsetRun display = offsets_ == nullptr ? OffsetRun{0, 0} : OffsetRunOf(sample);
-    while (sample < sampleCount_) {
-        while (sample - decode.first >= DurationCount(decode.entry)) {
-            decode.first += DurationCount(decode.entry);
-            decode.decodeTime += ncfUInt64{DurationCount(decode.entry)} * Duration(decode.entry);
-            ++decode.entry;
-        }
-        ncfUInt32 left = DurationCount(decode.entry) - (sample - decode.first);
-        ncfSInt32 offset = 0;
+    ncfUInt32 decodeLeft = 0;  // samples of the run at hand
+    ncfUInt32 displayLeft = offsets_ == nullptr ? sampleCount_ : 0;
+    ncfUInt32 duration = 0;
+    ncfSInt32 offset = 0;
+    if (sample < sampleCount_) {
+        duration = Duration(decode.entry);
+        decodeLeft = DurationCount(decode.entry) - (sample - decode.first);
+        decode.decodeTime += ncfUInt64{sample - decode.first} * duration;
         if (offsets_ != nullptr) {
-            while (sample - display.first >= OffsetCount(display.entry)) {
-                display.first += OffsetCount(display.entry);
-                ++display.entry;
-            }
-            left = std::min(left, OffsetCount(display.entry) - (sample - display.first));
+            offset = Offset(display.entry);
+            displayLeft = OffsetCount(display.entry) - (sample - display.first);
+        }
+    }
+    while (sample < sampleCount_) {
+        while (decodeLeft == 0) {
+            ++decode.entry;
+            decodeLeft = DurationCount(decode.entry);
+            duration = Duration(decode.entry);
+        }
+        while (displayLeft == 0) {
+            ++display.entry;
+            displayLeft = OffsetCount(display.entry);
             offset = Offset(display.entry);
         }
-        const ncfUInt32 duration = Duration(decode.entry);
-        const ncfUInt64 time = decode.decodeTime + ncfUInt64{sample - decode.first} * duration;
-        if (!visit(Stretch{sample, left, time, duration, offset})) {
+        const ncfUInt32 count = std::min(decodeLeft, displayLeft);
+        if (!visit(Stretch{sample, count, decode.decodeTime, duration, offset})) {
             return;
         }
-        sample += left;
+        decode.decodeTime += ncfUInt64{count} * duration;
+        decodeLeft -= count;
+        displayLeft -= count;
+        sample += count;
     }
 }
 

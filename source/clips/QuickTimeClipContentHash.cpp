@@ -10,6 +10,7 @@
 #include "public_include/SimpleFileIO.h"
 #include "source/clips/QuickTimeClip.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/os/Os.h"
 
 namespace {
 
@@ -18,11 +19,26 @@ constexpr ncfUInt64 maxChunkSize = 1048576;
 // Largest range that one read can fetch.
 constexpr ncfUInt64 kLargestRead = 0xFFFFFFFF;
 
-// Reads a range and appends all of it; a range that the file can't fill is
-// refused. An empty one adds nothing.
+NCFRESULT ReadWhole(const char* ncfFunction, NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset,
+                    ncfUInt32 size, ncfUInt8* bytes) {
+    ncfUInt32 actualRead = 0;
+    NCF_RETURN_TEXT("file_reader.Read(offset, &local[0], size, &actualRead)",
+                    file_reader.Read(offset, bytes, size, &actualRead));
+    return actualRead == size ? NCF_OK : NCF_E_FAIL;
+}
+
+// How much of the content is good, however the reading ends.
+struct Kept {
+    std::vector<ncfUInt8>& content;
+    std::size_t size;
+
+    ~Kept() { content.resize(size); }
+};
+
+// Reads a range behind what `content` holds; a range that the file can't fill
+// is refused and leaves nothing behind. An empty one adds nothing.
 NCFRESULT AppendRange(const char* ncfFunction, NMA::Impl::SimpleFileIO& file_reader,
-                      ncfUInt64 offset, ncfUInt64 size, std::vector<ncfUInt8>& local,
-                      std::vector<ncfUInt8>& content) {
+                      ncfUInt64 offset, ncfUInt64 size, std::vector<ncfUInt8>& content) {
     if (size == 0) {
         return NCF_OK;
     }
@@ -30,15 +46,16 @@ NCFRESULT AppendRange(const char* ncfFunction, NMA::Impl::SimpleFileIO& file_rea
         return NCF_E_FAIL;
     }
     const auto wanted = static_cast<ncfUInt32>(size);
-    local.resize(wanted);
-    ncfUInt32 actualRead = 0;
-    NCF_RETURN_TEXT("file_reader.Read(offset, &local[0], size, &actualRead)",
-                    file_reader.Read(offset, local.data(), wanted, &actualRead));
-    if (actualRead != wanted) {
-        return NCF_E_FAIL;
+    Kept kept{content, content.size()};
+    content.reserve(kept.size + wanted);
+    os::ExpectLargeBlock(content.data() + kept.size, wanted);
+    content.resize(kept.size + wanted);
+    const NCFRESULT result =
+        ReadWhole(ncfFunction, file_reader, offset, wanted, &content[kept.size]);
+    if (result >= 0) {
+        kept.size = content.size();
     }
-    content.insert(content.end(), local.begin(), local.end());
-    return NCF_OK;
+    return result;
 }
 
 }  // namespace
@@ -47,11 +64,10 @@ NCFRESULT QuickTimeClip::GetContentForHash(std::vector<ncfUInt8>& content) {
     NCF_FUNCTION("QuickTimeClip::GetContentForHash");
     content.clear();
     NMA::Impl::SimpleFileIO file_reader(fileName_.inArg());
-    std::vector<ncfUInt8> local;
     ncfUInt64 offset = 0;
     ncfUInt64 size = 0;
     NCF_RETURN(qtParser_->GetMOOVAtom(&offset, &size));
-    NCFRESULT result = AppendRange(ncfFunction, file_reader, offset, size, local, content);
+    NCFRESULT result = AppendRange(ncfFunction, file_reader, offset, size, content);
     if (result < 0) {
         return result;
     }
@@ -83,7 +99,7 @@ NCFRESULT QuickTimeClip::GetContentForHash(std::vector<ncfUInt8>& content) {
             // A file that was cut short may still have its beginning.
             pTable->GetDataOffset(1, &offset);
         }
-        result = AppendRange(ncfFunction, file_reader, offset, size, local, content);
+        result = AppendRange(ncfFunction, file_reader, offset, size, content);
         if (result < 0) {
             return result;
         }

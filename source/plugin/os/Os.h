@@ -40,6 +40,9 @@ bool Read(FileHandle file, void* buffer, ncfUInt32 size, ncfUInt32* bytesRead);
 // Memory at a multiple of `alignment`, a power of two; null when there is none.
 void* AllocateAligned(std::size_t size, std::size_t alignment);
 void FreeAligned(void* memory);
+// Tells the system that `bytes` at `memory`, not yet touched, are one large
+// block, so that it may back them with large pages. Only a hint.
+void ExpectLargeBlock(void* memory, std::size_t bytes);
 
 // --- dates -----------------------------------------------------------------
 

@@ -171,11 +171,30 @@ bool Read(FileHandle file, void* buffer, ncfUInt32 size, ncfUInt32* bytesRead) {
 
 void* AllocateAligned(std::size_t size, std::size_t alignment) {
     void* memory = nullptr;
-    return posix_memalign(&memory, alignment, size) == 0 ? memory : nullptr;
+    if (posix_memalign(&memory, alignment, size) != 0) {
+        return nullptr;
+    }
+    ExpectLargeBlock(memory, size);
+    return memory;
 }
 
 void FreeAligned(void* memory) {
     std::free(memory);
+}
+
+void ExpectLargeBlock(void* memory, std::size_t bytes) {
+#ifdef MADV_HUGEPAGE
+    constexpr std::uintptr_t kLargePage = std::uintptr_t{2} << 20;
+    const std::uintptr_t begin = reinterpret_cast<std::uintptr_t>(memory);
+    const std::uintptr_t first = (begin + kLargePage - 1) / kLargePage * kLargePage;
+    const std::uintptr_t end = (begin + bytes) / kLargePage * kLargePage;
+    if (first < end) {
+        madvise(reinterpret_cast<void*>(first), end - first, MADV_HUGEPAGE);
+    }
+#else
+    static_cast<void>(memory);
+    static_cast<void>(bytes);
+#endif
 }
 
 bool GetLastWriteTime(const std::u16string& path, DateTime* date) {

@@ -78,6 +78,9 @@ void FreeAligned(void* memory) {
     _aligned_free(memory);
 }
 
+// Large pages are a privilege that a module does not ask for.
+void ExpectLargeBlock(void*, std::size_t) {}
+
 bool GetLastWriteTime(const std::u16string& path, DateTime* date) {
     WIN32_FILE_ATTRIBUTE_DATA attributes{};
     SYSTEMTIME utc{};
