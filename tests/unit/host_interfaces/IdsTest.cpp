@@ -30,6 +30,11 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "host_interfaces/media/Sequences.h"
+#include "host_interfaces/parameters/ParameterIds.h"
+#include "host_interfaces/parameters/ParameterSuite.h"
+#include "host_interfaces/parameters/ParameterValue.h"
+#include "host_interfaces/parameters/ParametersReader.h"
+#include "host_interfaces/parameters/ParametersXML.h"
 #include "host_interfaces/quicktime/QuickTimeProperty.h"
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
 #include "host_interfaces/quicktime/Readers.h"
@@ -100,6 +105,20 @@ const IdRow kIds[] = {
     {"kCLSID_GenericDocHandler", kCLSID_GenericDocHandler, "4E40C813-86AD-4275-92CC-3AAB04EB1689"},
     {"IID_ISequences", NMA::IID_ISequences, "0D6E5A31-7C42-4B8E-9A57-4F83B1C0E206"},
     {"IID_IAAFSequences", NMA::IID_IAAFSequences, "84C2F1B7-5E0D-4A36-B1F8-6D20A79C3E07"},
+    {"kParamSetDefault", kParamSetDefault, "9F9FC555-4014-11C5-8FDE-5ED45EED7C03"},
+    {"kParamGroup", kParamGroup, "A1CE72A4-FA19-40E3-9E83-266DAF8AF5BB"},
+    {"kParamFieldOrdering", kParamFieldOrdering, "6CAEDE80-2DE0-4E2F-9F5D-904B7A2C2F4A"},
+    {"kParamFieldLayout", kParamFieldLayout, "76320B7E-5BF9-4E30-BF04-2BE7D48D4C69"},
+    {"kParamLevelRemapping", kParamLevelRemapping, "322655D5-0A56-46CA-9260-D006F719B8A4"},
+    {"kParamTypeChoice", kParamTypeChoice, "4AA0FBA6-F8E2-400F-A4A1-E8575B6EF887"},
+    {"CompID_ParameterSuite", CompID_ParameterSuite, "24AC2A8F-0577-4A6E-ACFE-44E10B9B01F3"},
+    {"IID_ParameterSuite", IID_ParameterSuite, "D53181F5-E685-4DD7-8480-3AE8304437D4"},
+    {"CompID_ParametersReader", CompID_ParametersReader, "55F676BA-5A00-4786-A682-BEF1FCAEE168"},
+    {"IID_ParametersReader", IID_ParametersReader, "0D182F2A-352A-4052-8940-FFBC4371318E"},
+    {"IID_IParametersHandler", NMA::IID_IParametersHandler, "30F807D9-A27E-4376-BA48-10E3514B2B4B"},
+    {"IID_IParameterValue", IID_IParameterValue, "5D0E7B34-93C1-4F6A-8A27-1C4F60B7D20C"},
+    {"IID_ValueFactory", IID_ValueFactory, "F9EA0EB0-7FD3-11D6-BEF9-00306542A024"},
+    {"IID_INCFParametersXML", IID_INCFParametersXML, "45FFBAE6-E8F4-48E9-A4A9-1C85BD8D063A"},
     {"CompID_QuickTimeProperty", QuickTime::CompID_QuickTimeProperty, "962000B9-686A-4AB8-B7B3-C4DE54843FDC"},
     {"IID_IQuickTimeProperty", QuickTime::IID_IQuickTimeProperty, "B353C798-86C5-4DBF-8C46-FA9310EB5B2E"},
     {"CompID_QuickTimeWrapper", QTWrapper::CompID_QuickTimeWrapper, "0B4C3D37-C23C-48D8-9A8F-BD71C3544465"},
@@ -200,6 +219,18 @@ TEST(Ids, AreThoseOfTheirInterfaces) {
     EXPECT_EQ(IdOf<IXmlElement>(), "9A93A6D5-798D-43F5-ADA1-F18A6D07454E");
     EXPECT_EQ(IdOf<IXmlAttribute>(), "72AF0713-70D9-4992-B3C7-E83FFE18EBB7");
     EXPECT_EQ(IdOf<IXmlWriter>(), "93B7F857-263B-463E-9EF9-9C66AC80C51C");
+    EXPECT_EQ(IdOf<IParameterSuite>(), "D53181F5-E685-4DD7-8480-3AE8304437D4");
+    EXPECT_EQ(IdOf<IParametersReader>(), "0D182F2A-352A-4052-8940-FFBC4371318E");
+    EXPECT_EQ(IdOf<NMA::IParametersHandler>(), "30F807D9-A27E-4376-BA48-10E3514B2B4B");
+    EXPECT_EQ(IdOf<IParameterValue>(), "5D0E7B34-93C1-4F6A-8A27-1C4F60B7D20C");
+    EXPECT_EQ(IdOf<IValueFactory>(), "F9EA0EB0-7FD3-11D6-BEF9-00306542A024");
+    EXPECT_EQ(IdOf<INCFParametersXML>(), "45FFBAE6-E8F4-48E9-A4A9-1C85BD8D063A");
+}
+
+
+// The factory of numbers goes by the type of what it makes.
+TEST(Ids, OfTheFactoryOfNumbersIsTheirType) {
+    EXPECT_EQ(TextOf(kValueTypeUInt32), "4EB1A950-7103-11D6-A663-0030658A6504");
 }
 
 }  // namespace
