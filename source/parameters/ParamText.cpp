@@ -1,0 +1,149 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "source/parameters/ParamText.h"
+
+#include <charconv>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <string>
+
+#include "source/descriptor_data/QTAttributesXMLParser.h"
+#include "source/plugin/ResultChecks.h"
+
+namespace NMA::XMLUtils::ParamText {
+namespace {
+
+constexpr char kTrue[] = "true";
+constexpr char kFalse[] = "false";
+
+// Requires: `at` is zero-terminated. Moves `at` behind the number.
+ncfUInt64 TakeSigned(const char*& at) {
+    char* end = nullptr;
+    const ncfSInt64 value = std::strtoll(at, &end, 10);
+    if (end == at) {
+        ThrowIfFailed(NCF_E_UNEXPECTED);
+    }
+    at = end;
+    return static_cast<ncfUInt64>(value);
+}
+
+// A minus sign is taken too and wraps, as scanners of unsigned numbers do.
+ncfUInt64 TakeUnsigned(const char*& at) {
+    char* end = nullptr;
+    const ncfUInt64 value = std::strtoull(at, &end, 10);
+    if (end == at) {
+        ThrowIfFailed(NCF_E_UNEXPECTED);
+    }
+    at = end;
+    return value;
+}
+
+}  // namespace
+
+void Read(const NMAString& text, ncfSInt32& out) {
+    const char* at = text.GetUTF8String();
+    out = static_cast<ncfSInt32>(static_cast<ncfUInt32>(TakeSigned(at)));
+}
+
+void Read(const NMAString& text, ncfUInt32& out) {
+    const char* at = text.GetUTF8String();
+    out = static_cast<ncfUInt32>(TakeUnsigned(at));
+}
+
+void Read(const NMAString& text, ncfSInt64& out) {
+    const char* at = text.GetUTF8String();
+    out = static_cast<ncfSInt64>(TakeSigned(at));
+}
+
+void Read(const NMAString& text, ncfUInt64& out) {
+    const char* at = text.GetUTF8String();
+    out = TakeUnsigned(at);
+}
+
+// The number is taken in single precision, and its bits become the low half of
+// the result, whose high half stays zero. So 1.5 reads as about 5.3e-315. Hosts
+// know the value by this form: widening it properly would change what they see.
+void Read(const NMAString& text, double& out) {
+    static_assert(sizeof(float) == sizeof(ncfUInt32) && sizeof(double) == sizeof(ncfUInt64),
+                  "the bits of a float fill half a double");
+    const char* const at = text.GetUTF8String();
+    char* end = nullptr;
+    const float scanned = std::strtof(at, &end);
+    if (end == at) {
+        ThrowIfFailed(NCF_E_UNEXPECTED);
+    }
+    ncfUInt32 low = 0;
+    std::memcpy(&low, &scanned, sizeof low);
+    const ncfUInt64 bits = low;
+    std::memcpy(&out, &bits, sizeof out);
+}
+
+void Read(const NMAString& text, NMAParamRational& out) {
+    const char* at = text.GetUTF8String();
+    NMAParamRational value;
+    value.numerator = static_cast<ncfSInt64>(TakeSigned(at));
+    if (*at != '/') {
+        ThrowIfFailed(NCF_E_UNEXPECTED);
+    }
+    ++at;
+    value.denominator = static_cast<ncfSInt64>(TakeSigned(at));
+    out = value;
+}
+
+void Read(const NMAString& text, GUID& out) {
+    if (!ParseHelperFunctions::StringToGUID(text, &out)) {
+        ThrowIfFailed(NCF_E_UNEXPECTED);
+    }
+}
+
+bool IsTrue(const NMAString& text) {
+    return std::strcmp(text.GetUTF8String(), kTrue) == 0;
+}
+
+NMAString Write(ncfSInt32 value) {
+    return NMAString(std::to_string(value).c_str());
+}
+
+NMAString Write(ncfUInt32 value) {
+    return NMAString(std::to_string(value).c_str());
+}
+
+NMAString Write(ncfSInt64 value) {
+    return NMAString(std::to_string(value).c_str());
+}
+
+NMAString Write(ncfUInt64 value) {
+    return NMAString(std::to_string(value).c_str());
+}
+
+// Six places behind a point, whatever the locale of the process.
+NMAString Write(double value) {
+    char digits[384];  // the largest double has 309 places before the point
+    const auto end =
+        std::to_chars(digits, digits + sizeof digits - 1, value, std::chars_format::fixed, 6);
+    *end.ptr = '\0';
+    return NMAString(digits);
+}
+
+NMAString Write(const NMAParamRational& value) {
+    const std::string text =
+        std::to_string(value.numerator) + "/" + std::to_string(value.denominator);
+    return NMAString(text.c_str());
+}
+
+NMAString Write(const GUID& value) {
+    char text[37];
+    std::snprintf(text, sizeof text, "%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X",
+                  static_cast<unsigned>(value.Data1), value.Data2, value.Data3, value.Data4[0],
+                  value.Data4[1], value.Data4[2], value.Data4[3], value.Data4[4], value.Data4[5],
+                  value.Data4[6], value.Data4[7]);
+    return NMAString(text);
+}
+
+NMAString WriteFlag(bool value) {
+    return NMAString(value ? kTrue : kFalse);
+}
+
+}  // namespace NMA::XMLUtils::ParamText
