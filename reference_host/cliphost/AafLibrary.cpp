@@ -38,6 +38,15 @@ AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
                                                    DisplayPath(file), name));
         }
     }
+    // The module asks the system for the library by its name alone.
+    if (!library_.IsFoundAs(kAAFLibraryName)) {
+        throw Failure(
+            kExitCaller,
+            fmt::format("{}: the module would not find this AAF library: it asks the system for "
+                        "{}; give the file that name and start again with LD_LIBRARY_PATH={}",
+                        DisplayPath(file), kAAFLibraryName,
+                        DisplayPath(std::filesystem::absolute(file).parent_path())));
+    }
 }
 
 bool AafLibrary::PinTime(const aafTimeStamp_t& time) {

@@ -23,6 +23,9 @@ public:
 
     // Null when the library exports no such function.
     void* Find(const char* name) const;
+    // Whether this library is what the process gets from now on when it asks the
+    // system for `name` without a folder.
+    bool IsFoundAs(const char* name) const;
 
 private:
     void* handle_ = nullptr;

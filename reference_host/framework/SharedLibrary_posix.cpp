@@ -34,4 +34,12 @@ void* SharedLibrary::Find(const char* name) const {
     return handle_ == nullptr ? nullptr : dlsym(handle_, name);
 }
 
+bool SharedLibrary::IsFoundAs(const char* name) const {
+    void* const found = dlopen(name, RTLD_NOW | RTLD_NOLOAD);
+    if (found != nullptr) {
+        dlclose(found);
+    }
+    return handle_ != nullptr && found == handle_;
+}
+
 }  // namespace host
