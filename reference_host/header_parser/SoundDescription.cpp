@@ -10,7 +10,8 @@ namespace header_parser {
 
 namespace {
 
-constexpr ncfUInt32 kMaxChannels = 65535;
+// No recorder writes more; a number from a broken header would size buffers.
+constexpr ncfUInt32 kMaxChannels = 1024;
 
 enum LinearFlags : ncfUInt32 {
     kFlagBigEndian = 2,

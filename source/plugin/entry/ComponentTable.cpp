@@ -48,9 +48,8 @@ const ComponentRow kComponents[kComponentCount] = {
      ncfGuid("C5D1D369-62EF-46F8-84B8-1700F1153100"), 1, 3, nullptr},
     {"GenericDocumentHandler", kCLSID_GenericDocHandler,
      ncfGuid("A235C6D4-35F8-4A18-8CD1-7E96A8EBF842"), 1, 3, &Impl::CreateGenericDocHandler},
-    // Parameters have no creation function yet.
     {"QTParameters", CompID_QTParameters,
-     ncfGuid("5ECB2244-6B8F-41FD-9E36-71EAE5501230"), 1, 3, nullptr},
+     ncfGuid("5ECB2244-6B8F-41FD-9E36-71EAE5501230"), 1, 3, &Impl::CreateQTParameters},
 };
 // clang-format on
 

@@ -9,6 +9,7 @@
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "source/plugin/CNCFClassFactory.h"
+#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/NCFSmartPtr.h"
 #include "source/plugin/PluginFolder.h"
 #include "source/plugin/PluginLogSink.h"
@@ -51,17 +52,13 @@ void SetNumber(const Pointer& definition, const NumberAttribute& attribute) {
                                            sizeof attribute.value));
 }
 
-// Runs a body that may throw and turns what it throws into a result.
+// A body that throws or succeeds.
 template <class Body>
 NCFRESULT Guarded(Body body) {
-    try {
+    return NMA::Impl::InterfaceEntry([&] {
         body();
         return NCF_OK;
-    } catch (NCFRESULT failure) {
-        return failure;
-    } catch (...) {
-        return NCF_E_UNEXPECTED;
-    }
+    });
 }
 
 NMAString ModulePath() {

@@ -82,6 +82,12 @@ TEST(SoundDescription, TellsTheOldLinearCodesInVersions0And1) {
     }
 }
 
+TEST(SoundDescription, RefusesMoreChannelsThanAnyRecorderWrites) {
+    EXPECT_EQ(Parse(Format("sowt", 16, 0, 1024).ToBox()), Linear(1024, 16, true));
+    EXPECT_EQ(ParseMovie(Format("sowt", 16, 0, 1025).ToBox()).Reason(),
+              "a sound description has too many channels");
+}
+
 TEST(SoundDescription, TakesACodeOfZeroForTheOldestLinearSound) {
     SoundFormat format;
     format.codec = std::string(4, '\0');
