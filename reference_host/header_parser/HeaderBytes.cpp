@@ -2,32 +2,12 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/HeaderBytes.h"
 
-#include <sys/mman.h>
-
 #include <algorithm>
-#include <cstdint>
 #include <cstring>
 
+#include "reference_host/header_parser/LargeBlock.h"
+
 namespace header_parser {
-
-namespace {
-
-constexpr ncfUInt64 kLargePage = ncfUInt64{2} << 20;
-
-// Page by page, a block of a hundred megabytes costs more to touch than to
-// parse; the hint lets the system back it with large pages.
-void ExpectLargeBlock(ncfUInt8* memory, ncfUInt64 bytes) {
-#ifdef MADV_HUGEPAGE
-    const auto begin = reinterpret_cast<std::uintptr_t>(memory);
-    const std::uintptr_t first = (begin + kLargePage - 1) / kLargePage * kLargePage;
-    const std::uintptr_t end = (begin + bytes) / kLargePage * kLargePage;
-    if (first < end) {
-        madvise(reinterpret_cast<void*>(first), end - first, MADV_HUGEPAGE);
-    }
-#endif
-}
-
-}  // namespace
 
 ncfUInt64 HeaderBytes::NextCapacity(ncfUInt64 needed) const {
     return std::max({needed, size_ * 2, std::min(expected_, size_ * 16)});
