@@ -6,18 +6,16 @@
 
 #include "source/essence/QuickTimeSampleMapping.h"
 
+#include "host_interfaces/media/PluginComponents.h"
+#include "host_interfaces/parameters/ParametersXML.h"
 #include "source/clips/LoadMedia.h"
 #include "source/essence/ProviderLock.h"
+#include "source/parameters/QTParameters.h"
 #include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::Impl {
-namespace {
-
-constexpr GUID kParametersXML = ncfGuid("45FFBAE6-E8F4-48E9-A4A9-1C85BD8D063A");
-
-}  // namespace
 
 NCFRESULT CreateQuickTimeSampleMapping(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
                                        void** out) {
@@ -57,7 +55,7 @@ NCFRESULT QuickTimeSampleMapping::InternalQueryInterface(const GUID& iid, void**
         if (ncf_detail::AnswerInterface<IUncompressedAudioProvider>(this, iid, ppvObj)) {
             return PrepareAudioProvider();
         }
-        if (iid == kParametersXML) {
+        if (iid == IID_INCFParametersXML) {
             return QueryParametersXML(ppvObj);
         }
         return CNCFUnknown::InternalQueryInterface(iid, ppvObj);
@@ -92,11 +90,25 @@ NCFRESULT QuickTimeSampleMapping::PrepareAudioProvider() {
     return NCF_OK;
 }
 
-// The per-clip parameters have no component yet: their interface is answered
-// like any that is unknown.
+// The answer is another object each time: new parameters that belong to this
+// mapping and keep it alive. Nothing is handed out on failure.
 NCFRESULT QuickTimeSampleMapping::QueryParametersXML(void** ppvObj) {
+    NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::InternalQueryInterface");
     *ppvObj = nullptr;
-    return NCF_E_NOINTERFACE;
+    if (!media_) {
+        NCF_RETURN(LoadMedia(_filePath, _pConsole, _pComponentFactory, media_));
+    }
+    NCFSmartPtr<INCFParametersXML> created;
+    NCF_RETURN_TEXT("_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, IID_INCFParametersXML, ppvObj)",
+                    ncfCreate(_pComponentFactory.inArg(), CompID_QTParameters, IID_INCFParametersXML, created));
+    // Only the module's own parameters can be attached.
+    auto* const pParams = dynamic_cast<QTParameters*>(created.inArg());
+    if (!pParams) {
+        return NCF_E_UNEXPECTED;
+    }
+    NCF_RETURN(pParams->AttachToQTSampleProvider(*this));
+    *ppvObj = created.detach();
+    return NCF_OK;
 }
 
 // --- what the container and the parameters call ---------------------------------------

@@ -45,6 +45,8 @@ public:
     // After a change of the clip's parameters: adds the formats that they
     // bring and lets the clip work out its fields again.
     NCFRESULT RefreshBasedOnUIParams();
+    // The clip, null before there is one.
+    const std::tr1::shared_ptr<BaseClip>& GetMediaClip() const { return media_; }
     // The movie's id of a host track.
     NCFRESULT AAFTrackToQuickTimeTrack(ncfUInt32 trackNMA, ncfUInt32* trackQTOut);
 

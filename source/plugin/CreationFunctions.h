@@ -22,5 +22,6 @@ NCFRESULT CreateQuickTimeSampleMapping(INCFUnknown* host, INCFUnknown* outer, co
                                        void** out);
 NCFRESULT CreateGenericDocHandler(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
                                   void** out);
+NCFRESULT CreateQTParameters(INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out);
 
 }  // namespace NMA::Impl

@@ -68,8 +68,7 @@ struct ComponentRow {
     bool hasFactory;
 };
 
-// The one that waits for its subsystem has no factory yet; registered clips
-// never have one.
+// Registered clips have no factory.
 constexpr ComponentRow kComponents[] = {
     {"QuickTimeMediaVolume", ncfGuid("A0529DD3-C63D-45EA-AF2A-D962C0DFB5B5"),
      ncfGuid("2C839849-53E5-428A-8669-ED79FE70299B"), 3, true},
@@ -88,7 +87,7 @@ constexpr ComponentRow kComponents[] = {
     {"GenericDocumentHandler", ncfGuid("4E40C813-86AD-4275-92CC-3AAB04EB1689"),
      ncfGuid("A235C6D4-35F8-4A18-8CD1-7E96A8EBF842"), 3, true},
     {"QTParameters", ncfGuid("E01FB758-46AA-479F-BADA-1FB47C8D522C"),
-     ncfGuid("5ECB2244-6B8F-41FD-9E36-71EAE5501230"), 3, false},
+     ncfGuid("5ECB2244-6B8F-41FD-9E36-71EAE5501230"), 3, true},
 };
 
 TEST_F(Module, RegistersNineComponents) {

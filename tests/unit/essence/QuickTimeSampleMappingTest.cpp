@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 #include "host_interfaces/header_parser/QTParser.h"
+#include "host_interfaces/media/PluginComponents.h"
+#include "host_interfaces/parameters/ParametersXML.h"
 #include "tests/unit/essence/support/MappingFixture.h"
 
 namespace {
@@ -89,11 +91,73 @@ TEST_F(SampleMapping, RefusesANullOutputSilentlyAndAnUnknownInterface) {
     EXPECT_TRUE(log->records().empty());
 }
 
-TEST_F(SampleMapping, HasNoParametersYet) {
+// --- the parameters -------------------------------------------------------------------------
+
+TEST_F(SampleMapping, GivesNewParametersOfItsClipForEachQuery) {
+    AddVideo(1);
+    Bind();
+    host->maker(NMA::CompID_QTParameters, [this](const GUID& iid, void** out) {
+        return NMA::Impl::CreateQTParameters(host->unknown(), nullptr, iid, out);
+    });
+    INCFParametersXML* answers[2] = {};
+    for (INCFParametersXML*& answer : answers) {
+        ASSERT_EQ(mapping->QueryInterface(IID_INCFParametersXML, reinterpret_cast<void**>(&answer)),
+                  NCF_OK);
+        clip->setLevels(Expand_Levels);
+        EXPECT_EQ(answer->ResetParameters(), NCF_OK) << "they are attached";
+        EXPECT_EQ(clip->GetClipParams()->levelRemap, static_cast<ncfUInt32>(Default_Levels));
+    }
+    EXPECT_NE(answers[0], answers[1]);
+    EXPECT_EQ(journal.count("lock"), 0) << "the lock is not for this";
+    for (INCFParametersXML* const answer : answers) {
+        EXPECT_EQ(answer->Release(), 0u) << "one reference each, and none of the mapping's";
+    }
+}
+
+TEST_F(SampleMapping, GivesTheRefusalOfItsParameters) {
+    AddVideo(1);
+    Bind();
     auto* out = reinterpret_cast<void*>(this);
-    EXPECT_EQ(mapping->QueryInterface(ncfGuid("45FFBAE6-E8F4-48E9-A4A9-1C85BD8D063A"), &out),
-              NCF_E_NOINTERFACE);
+    host->refuseCreation(NMA::CompID_QTParameters, NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(mapping->QueryInterface(IID_INCFParametersXML, &out), NCF_E_OUTOFMEMORY);
     EXPECT_EQ(out, nullptr);
+    EXPECT_EQ(log->count(Record("80000002",
+                                "_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, "
+                                "IID_INCFParametersXML, ppvObj)",
+                                "InternalQueryInterface")),
+              1);
+}
+
+TEST_F(SampleMapping, CannotUseParametersThatAreNotTheModulesOwn) {
+    struct Foreign : FakeObject<INCFParametersXML> {
+        NCFRESULT GetParameterValuesXML(INCFString*) override { return NCF_OK; }
+        NCFRESULT GetParameterDescriptionXML(INCFString*) override { return NCF_OK; }
+        NCFRESULT GetDefaultValuesXML(INCFString*) override { return NCF_OK; }
+        NCFRESULT SetParameterValuesXML(INCFString*) override { return NCF_OK; }
+        NCFRESULT ParametersUnsupportedOperation(void*) override { return NCF_OK; }
+        NCFRESULT ResetParameters() override { return NCF_OK; }
+    };
+    AddVideo(1);
+    Bind();
+    host->maker(NMA::CompID_QTParameters, [](const GUID&, void** out) {
+        *out = static_cast<INCFParametersXML*>(new Foreign);
+        return NCF_OK;
+    });
+    auto* out = reinterpret_cast<void*>(this);
+    EXPECT_EQ(mapping->QueryInterface(IID_INCFParametersXML, &out), NCF_E_UNEXPECTED);
+    EXPECT_EQ(out, nullptr);
+}
+
+TEST_F(SampleMapping, ParametersQueryWithoutAClipLoadsItFirst) {
+    NCFSmartPtr<INCFString> path;
+    path.attach(MakeHostString("/no/such/movie.mov"));
+    ASSERT_EQ(mapping->SetFilePath(path), NCF_OK);
+    EXPECT_EQ(Query(IID_INCFParametersXML), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(host->creations(NMA::CompID_QTParameters), 0);
+    EXPECT_EQ(
+        log->count(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
+                          "InternalQueryInterface")),
+        1);
 }
 
 // --- the image query -----------------------------------------------------------------------

@@ -56,6 +56,7 @@ STAND_IN(CreateQuickTimeMasterClips)
 STAND_IN(CreateQuickTimeVolumeInfo)
 STAND_IN(CreateQuickTimeSampleMapping)
 STAND_IN(CreateGenericDocHandler)
+STAND_IN(CreateQTParameters)
 }  // namespace NMA::Impl
 
 namespace {
@@ -252,7 +253,7 @@ constexpr ExpectedComponent kExpected[] = {
     {"GenericDocumentHandler", "4E40C813-86AD-4275-92CC-3AAB04EB1689",
      "A235C6D4-35F8-4A18-8CD1-7E96A8EBF842", "1.3", true},
     {"QTParameters", "E01FB758-46AA-479F-BADA-1FB47C8D522C", "5ECB2244-6B8F-41FD-9E36-71EAE5501230",
-     "1.3", false},
+     "1.3", true},
 };
 
 TEST_F(EntryPoints, RegisterEveryComponentWithItsRowBetweenTheAttributes) {
@@ -342,7 +343,7 @@ TEST_F(EntryPoints, GiveAClassFactoryForEveryClassThatIsServed) {
                                     "CreateQuickTimeSampleMapping",
                                     nullptr,
                                     "CreateGenericDocHandler",
-                                    nullptr};
+                                    "CreateQTParameters"};
     for (ncfUInt32 index = 0; index < kComponentCount; ++index) {
         journal.clear();
         void* out = reinterpret_cast<void*>(&host);

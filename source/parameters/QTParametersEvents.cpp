@@ -1,0 +1,94 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// What the host's reader tells of a document of values. Values are taken inside
+// this module's component and a set in use, and nowhere else.
+
+#include "host_interfaces/media/PluginComponents.h"
+#include "source/parameters/QTParameters.h"
+#include "source/plugin/InterfaceEntry.h"
+#include "source/plugin/ResultChecks.h"
+
+namespace NMA::Impl {
+namespace {
+
+// State of a set as the reader tells it. Any state but the first makes the set
+// the current one; only one lets values through.
+constexpr ncfUInt32 kSetNotInUse = 0;
+constexpr ncfUInt32 kSetWithValues = 1;
+
+struct Target {
+    GUID parameter;
+    ncfUInt32 ClipParams::*field;
+};
+
+constexpr Target kTargets[] = {
+    {kParamFieldOrdering, &ClipParams::fieldOrderInFile},
+    {kParamLevelRemapping, &ClipParams::levelRemap},
+    {kParamFieldLayout, &ClipParams::fieldLayout},
+};
+
+}  // namespace
+
+NCFRESULT QTParameters::BeginDocument() {
+    _inComponent = false;
+    return NCF_OK;
+}
+
+NCFRESULT QTParameters::BeginComponent(const GUID& component) {
+    _inComponent = component == CompID_QuickTimeSampleMapping;
+    _inSet = false;
+    return NCF_OK;
+}
+
+NCFRESULT QTParameters::EndComponent(ncfUInt32 isWhole) {
+    if (isWhole) {
+        _inComponent = false;
+        _inSet = false;
+    }
+    return NCF_OK;
+}
+
+NCFRESULT QTParameters::BeginParamSet(const GUID& set, INCFString* name, float, ncfUInt32 state) {
+    return InterfaceEntry([&] {
+        _inSet = state == kSetWithValues;
+        if (state == kSetNotInUse) {
+            return NCF_OK;
+        }
+        _setId = set;
+        // The text is copied: the reader's string may change under this object,
+        // and a reset would write into it.
+        ThrowIfFailed(name ? _setName->Assign(name)
+                           : _setName->AssignUTF8(kNCFUTF8, "", kNCFZeroTerminated));
+        return NCF_OK;
+    });
+}
+
+NCFRESULT QTParameters::ParamValue(const GUID& parameter, IParameterValue* value) {
+    return InterfaceEntry([&]() -> NCFRESULT {
+        if (!_inComponent || !_inSet || !_clipParams) {
+            return NCF_OK;
+        }
+        for (const Target& target : kTargets) {
+            if (target.parameter == parameter) {
+                if (!value) {
+                    return NCF_E_POINTER;
+                }
+                // The number is taken as it comes, a choice or not.
+                ncfUInt32 number = 0;
+                ThrowIfFailed(value->GetData(&number, sizeof number));
+                _clipParams->*target.field = number;
+                return NCF_OK;
+            }
+        }
+        return NCF_OK;
+    });
+}
+
+NCFRESULT QTParameters::EndDocument() {
+    _inComponent = false;
+    _inSet = false;
+    return NCF_OK;
+}
+
+}  // namespace NMA::Impl
