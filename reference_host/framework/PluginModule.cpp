@@ -68,7 +68,7 @@ PluginModule::~PluginModule() {
     }
 }
 
-NCFRESULT PluginModule::CanUnload() {
+NCFRESULT PluginModule::CanUnload() const {
     return started_ ? functions_.canUnloadNow(host_.get()) : NCF_OK;
 }
 

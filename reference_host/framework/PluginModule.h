@@ -42,7 +42,7 @@ public:
     const std::vector<ComponentFacts>& components() const { return components_; }
 
     // What NCFCanUnloadNow says: NCF_OK when no object of the module is alive.
-    NCFRESULT CanUnload();
+    NCFRESULT CanUnload() const;
     // A refusal is the result, and the module goes on as before.
     NCFRESULT Unload();
 

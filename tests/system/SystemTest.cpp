@@ -38,7 +38,7 @@ void SystemTest::End() {
 }
 
 bool SystemTest::ModuleIsIdle() {
-    return const_cast<host::PluginModule&>(session_->plugin()).CanUnload() == NCF_OK;
+    return session_->plugin().CanUnload() == NCF_OK;
 }
 
 void SystemTest::TearDown() {

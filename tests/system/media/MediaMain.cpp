@@ -26,8 +26,7 @@ int Check(const std::filesystem::path& file) {
         cliphost::Session session(options);
         const auto files = OpenFiles();
         verdict = CheckMedia(session, file, folder / "saved.aaf");
-        isClean = OpenFiles() == files &&
-                  const_cast<host::PluginModule&>(session.plugin()).CanUnload() == NCF_OK;
+        isClean = OpenFiles() == files && session.plugin().CanUnload() == NCF_OK;
     }
     isClean = isClean && host::LiveObjectCount() == 0;
     std::filesystem::remove_all(folder);
