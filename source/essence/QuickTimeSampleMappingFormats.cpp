@@ -78,7 +78,7 @@ NCFRESULT QuickTimeSampleMapping::ReadCodecPixelFormats(QuickTime::IQuickTimePro
         }
     }
     _codecPixelFormats.assign(codecPixelFormats_ptr ? count : 0, 0);
-    if (!_codecPixelFormats.empty()) {
+    if (codecPixelFormats_ptr) {
         std::memcpy(_codecPixelFormats.data(), codecPixelFormats_ptr, count * sizeof(ncfUInt32));
     }
     return NCF_OK;
