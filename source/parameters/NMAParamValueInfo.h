@@ -46,7 +46,9 @@ public:
     // throws NCF_E_UNEXPECTED.
     NCFRESULT GetDiscreteInfo(ncfUInt32** outValues, ncfUInt32* outCount,
                               ncfUInt32* outDefault) const;
-    // NCF_E_INVALIDARG for values that are null, unless the count is 0.
+    // NCF_E_INVALIDARG for values that are null, unless the count is 0. A list
+    // that was read from a text stands in the way of the new one until the
+    // document is saved: reading throws NMA_E_NODATA till then.
     NCFRESULT SetDiscreteInfo(const ncfUInt32* values, ncfUInt32 count, ncfUInt32 defaultValue);
 
 private:
