@@ -20,18 +20,31 @@ NCFRESULT Buffer::Allocate(ncfUInt64 size, ncfUInt32 alignment) {
     if (size > static_cast<ncfUInt64>(std::numeric_limits<std::ptrdiff_t>::max())) {
         return NCF_E_OUTOFMEMORY;
     }
+    if (block_ != nullptr && size <= capacity_ && alignment_ >= wanted) {
+        Begin(size);
+        return NCF_OK;
+    }
     // Even an empty block has an address.
     const std::size_t bytes = size == 0 ? 1 : static_cast<std::size_t>(size);
     void* block = ::operator new (bytes, std::align_val_t{wanted}, std::nothrow);
     if (block == nullptr) {
         return NCF_E_OUTOFMEMORY;
     }
-    std::memset(block, 0, bytes);
     Free();
     block_ = static_cast<unsigned char*>(block);
-    size_ = size;
+    capacity_ = bytes;
     alignment_ = wanted;
+    Begin(size);
     return NCF_OK;
+}
+
+// A module may leave parts of a block as they were, so it starts cleared.
+void Buffer::Begin(ncfUInt64 size) {
+    size_ = size;
+    state_ = 0;
+    validBytes_ = 0;
+    result_ = NCF_OK;
+    std::memset(block_, 0, static_cast<std::size_t>(size));
 }
 
 NCFRESULT Buffer::GetBufferPointer(void** start) {
@@ -58,9 +71,7 @@ void Buffer::Free() {
     }
     block_ = nullptr;
     size_ = 0;
-    state_ = 0;
-    validBytes_ = 0;
-    result_ = NCF_OK;
+    capacity_ = 0;
 }
 
 }  // namespace host

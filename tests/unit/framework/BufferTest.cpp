@@ -67,3 +67,36 @@ TEST(Buffer, AnEmptyBlockHasAnAddress) {
     EXPECT_NE(nullptr, start);
     EXPECT_EQ(0u, buffer->size());
 }
+
+TEST(Buffer, KeepsItsMemoryForTheNextBlockThatFitsAndClearsIt) {
+    const auto buffer = MakeRef<Buffer>();
+    ASSERT_EQ(NCF_OK, buffer->Allocate(1000, 16));
+    void* first = nullptr;
+    ASSERT_EQ(NCF_OK, buffer->GetBufferPointer(&first));
+    std::fill_n(static_cast<unsigned char*>(first), 1000, static_cast<unsigned char>(0xAA));
+    ASSERT_EQ(NCF_OK, buffer->SetComplete(kNCFBuffer_Complete, 1000, NCF_E_FAIL));
+
+    ASSERT_EQ(NCF_OK, buffer->Allocate(600, 1));
+    EXPECT_EQ(first, buffer->bytes());
+    EXPECT_EQ(600u, buffer->size());
+    EXPECT_FALSE(buffer->isComplete());
+    EXPECT_EQ(0u, buffer->validBytes());
+    EXPECT_EQ(NCF_OK, buffer->result());
+    EXPECT_TRUE(std::all_of(buffer->bytes(), buffer->bytes() + 600,
+                            [](unsigned char b) { return b == 0; }));
+    // Back at the full size the memory is still the same, and clear to its end.
+    ASSERT_EQ(NCF_OK, buffer->Allocate(1000, 16));
+    EXPECT_EQ(first, buffer->bytes());
+    EXPECT_TRUE(std::all_of(buffer->bytes(), buffer->bytes() + 1000,
+                            [](unsigned char b) { return b == 0; }));
+}
+
+TEST(Buffer, TakesNewMemoryForALargerBlockOrAStricterAlignment) {
+    const auto buffer = MakeRef<Buffer>();
+    ASSERT_EQ(NCF_OK, buffer->Allocate(100, 1));
+    ASSERT_EQ(NCF_OK, buffer->Allocate(200, 1));
+    EXPECT_EQ(200u, buffer->capacity());
+    ASSERT_EQ(NCF_OK, buffer->Allocate(100, 4096));
+    EXPECT_EQ(0u, reinterpret_cast<std::uintptr_t>(buffer->bytes()) % 4096);
+    EXPECT_EQ(100u, buffer->capacity());
+}
