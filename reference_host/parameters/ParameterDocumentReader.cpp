@@ -1,0 +1,273 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <charconv>
+#include <cmath>
+#include <cstring>
+
+#include "reference_host/framework/Guard.h"
+#include "reference_host/parameters/GuidText.h"
+#include "reference_host/parameters/ParameterDocument.h"
+#include "reference_host/parameters/ParameterNames.h"
+#include "reference_host/xml/EventReader.h"
+#include "reference_host/xml/XmlTree.h"
+
+namespace host {
+
+namespace {
+
+using namespace parameter_names;
+
+// What ends the reading.
+struct Refusal {
+    NCFRESULT result;
+    std::string problem;
+};
+
+class NoEvents final : public XmlEvents {
+public:
+    NCFRESULT OnElement(const char*, const char**) override { return NCF_OK; }
+    NCFRESULT OnText(std::string_view) override { return NCF_OK; }
+};
+
+// "component/track/parameterSet": where a node stands.
+std::string PlaceOf(const pugi::xml_node& node) {
+    std::string place = node.path('/');
+    return place.size() > 200 ? place.substr(0, 200) + "..." : place.substr(place.empty() ? 0 : 1);
+}
+
+[[noreturn]] void Refuse(const pugi::xml_node& node, const std::string& what,
+                         NCFRESULT result = NCF_E_INVALIDARG) {
+    throw Refusal{result, PlaceOf(node) + ": " + what};
+}
+
+// A foreign text for a message: short, on one line.
+std::string Shown(std::string_view text) {
+    std::string shown = "\"";
+    for (const char c : text.substr(0, 60)) {
+        shown += static_cast<unsigned char>(c) < 0x20 ? ' ' : c;
+    }
+    return shown + (text.size() > 60 ? "...\"" : "\"");
+}
+
+std::string_view Trimmed(std::string_view text) {
+    constexpr char kSpace[] = " \t\r\n";
+    const std::size_t first = text.find_first_not_of(kSpace);
+    return first == std::string_view::npos
+               ? std::string_view()
+               : text.substr(first, text.find_last_not_of(kSpace) - first + 1);
+}
+
+// The whole text of an element; marks and comments in it are passed over.
+std::string TextOf(const pugi::xml_node& node) {
+    std::string text;
+    for (const pugi::xml_node& child : node.children()) {
+        if (child.type() == pugi::node_pcdata || child.type() == pugi::node_cdata) {
+            text += child.value();
+        }
+        if (text.size() > ParameterLimits::kLongestText) {
+            Refuse(node, "a text that is too long", NCF_E_NOTSUPPORTED);
+        }
+    }
+    return text;
+}
+
+std::string ChildText(const pugi::xml_node& node, const char* name) {
+    const pugi::xml_node child = node.child(name);
+    return child ? TextOf(child) : std::string();
+}
+
+GUID Id(const pugi::xml_node& node, std::string_view text, const char* what) {
+    GUID id{};
+    if (!ReadGuid(Trimmed(text), id)) {
+        Refuse(node, std::string(what) + " is " + Shown(text) + ", which is no identifier");
+    }
+    return id;
+}
+
+GUID IdAttribute(const pugi::xml_node& node) {
+    const pugi::xml_attribute attribute = node.attribute(kId);
+    if (!attribute) {
+        Refuse(node, "has no id");
+    }
+    return Id(node, attribute.value(), "the id");
+}
+
+ncfUInt32 Number(const pugi::xml_node& node, std::string_view text) {
+    const std::string_view digits = Trimmed(text);
+    ncfUInt32 number = 0;
+    const auto end = std::from_chars(digits.data(), digits.data() + digits.size(), number);
+    if (digits.empty() || end.ec != std::errc() || end.ptr != digits.data() + digits.size()) {
+        Refuse(node, "holds " + Shown(text) + ", which is no number of 32 bits without sign");
+    }
+    return number;
+}
+
+float Version(const pugi::xml_node& node) {
+    const pugi::xml_node child = node.child(kVersion);
+    if (!child) {
+        return 1.0f;
+    }
+    const std::string text = TextOf(child);
+    const std::string_view digits = Trimmed(text);
+    float number = 0.0f;
+    const auto end = std::from_chars(digits.data(), digits.data() + digits.size(), number);
+    if (digits.empty() || end.ec != std::errc() || end.ptr != digits.data() + digits.size() ||
+        !std::isfinite(number)) {
+        Refuse(child, "holds " + Shown(text) + ", which is no version");
+    }
+    return number;
+}
+
+bool Flag(const pugi::xml_node& node, const char* name) {
+    return std::strcmp(node.attribute(name).value(), kTrue) == 0;
+}
+
+// --- the description -------------------------------------------------------------------
+
+ParameterInfo ReadInfo(const pugi::xml_node& node) {
+    ParameterInfo info;
+    info.id = IdAttribute(node);
+    info.name = ChildText(node, kShortName);
+    info.label = ChildText(node, kDescription);
+    const pugi::xml_node discrete = node.child(kValueInfo).child(kDiscreteInfo);
+    for (const pugi::xml_node& choice : discrete.children(kDiscrete)) {
+        const char* const name = choice.attribute(kName).value();
+        if (std::strlen(name) > ParameterLimits::kLongestText) {
+            Refuse(choice, "a name that is too long", NCF_E_NOTSUPPORTED);
+        }
+        info.choices.push_back({Number(choice, choice.attribute(kValue).value()), name});
+    }
+    if (const pugi::xml_attribute value = discrete.attribute(kDefault)) {
+        const ncfUInt32 number = Number(discrete, value.value());
+        if (number != kNoDefault) {
+            info.defaultValue = number;
+        }
+    }
+    return info;
+}
+
+// Groups of groups come out one after the other. Their depth is that of the
+// document, which is bounded.
+void ReadGroups(const pugi::xml_node& parent, std::vector<ParameterGroup>& out) {
+    for (const pugi::xml_node& node : parent.children(kGroup)) {
+        ParameterGroup group;
+        group.id = IdAttribute(node);
+        group.name = ChildText(node, kShortName);
+        group.isShown = std::strcmp(node.attribute(kDisplayState).value(), kHide) != 0;
+        for (const pugi::xml_node& parameter : node.children(kParameter)) {
+            group.parameters.push_back(ReadInfo(parameter));
+        }
+        out.push_back(std::move(group));
+        ReadGroups(node, out);
+    }
+}
+
+// --- sets -----------------------------------------------------------------------------------
+
+ParameterSetting ReadSetting(const pugi::xml_node& node) {
+    ParameterSetting setting;
+    setting.parameter = IdAttribute(node);
+    for (const char* const name : {kValueUInt32, kValueDiscrete}) {
+        if (const pugi::xml_node value = node.child(name)) {
+            setting.value = Number(value, TextOf(value));
+            return setting;
+        }
+    }
+    return setting;
+}
+
+ParameterSet ReadSet(const pugi::xml_node& node) {
+    ParameterSet set;
+    set.id = IdAttribute(node);
+    set.name = ChildText(node, kName);
+    set.version = Version(node);
+    set.isDefault = Flag(node, kDefault);
+    set.isReadOnly = Flag(node, kReadOnly);
+    for (const pugi::xml_node& parameter : node.children(kParameter)) {
+        set.settings.push_back(ReadSetting(parameter));
+    }
+    return set;
+}
+
+ParameterTrack ReadTrack(const pugi::xml_node& node) {
+    ParameterTrack track;
+    track.number = Number(node, node.attribute(kNumber).value());
+    if (const pugi::xml_node infos = node.child(kInfos)) {
+        track.descriptionVersion = Version(infos);
+        for (const pugi::xml_node& parameter : infos.children(kParameter)) {
+            track.parameters.push_back(ReadInfo(parameter));
+        }
+        ReadGroups(infos, track.groups);
+    }
+    if (const pugi::xml_node active = node.child(kActiveSet)) {
+        track.activeSet = Id(active, TextOf(active), "the set");
+    }
+    for (const pugi::xml_node& set : node.children(kSet)) {
+        track.sets.push_back(ReadSet(set));
+    }
+    return track;
+}
+
+ParameterDocument ReadRoot(const pugi::xml_node& root) {
+    if (std::strcmp(root.name(), kRoot) != 0) {
+        Refuse(root, std::string("the outermost element of a parameter document is ") + kRoot);
+    }
+    ParameterDocument document;
+    for (const pugi::xml_node& node : root.children(kComponent)) {
+        ParameterComponent component;
+        component.id = IdAttribute(node);
+        for (const pugi::xml_node& track : node.children(kTrack)) {
+            component.tracks.push_back(ReadTrack(track));
+        }
+        document.components.push_back(std::move(component));
+    }
+    return document;
+}
+
+}  // namespace
+
+bool ParameterTrack::IsInUse(const ParameterSet& set) const {
+    return activeSet ? set.id == *activeSet : sets.size() == 1;
+}
+
+const ParameterSet* ParameterTrack::SetInUse() const {
+    for (const ParameterSet& set : sets) {
+        if (IsInUse(set)) {
+            return &set;
+        }
+    }
+    return nullptr;
+}
+
+NCFRESULT ReadParameterDocument(std::string_view xml, ParameterDocument& out,
+                                std::string& problem) {
+    return Guarded([&]() -> NCFRESULT {
+        if (xml.size() > ParameterLimits::kLargestDocument) {
+            problem = "more than " + std::to_string(ParameterLimits::kLargestDocument >> 20) +
+                      " MiB, which no parameter document needs";
+            return NCF_E_NOTSUPPORTED;
+        }
+        // First for its words: the tree's own check has none.
+        NoEvents events;
+        EventReader check(events, "UTF-8");
+        NCFRESULT result = check.Feed(xml.data(), xml.size(), true);
+        if (result < 0) {
+            problem = check.problem();
+            return result;
+        }
+        const auto tree = XmlTree::Load(std::string(xml), "UTF-8", result);
+        if (tree == nullptr) {
+            problem = "it can't be read";
+            return result;
+        }
+        try {
+            out = ReadRoot(tree->root());
+        } catch (const Refusal& refusal) {
+            problem = refusal.problem;
+            return refusal.result;
+        }
+        return NCF_OK;
+    });
+}
+
+}  // namespace host

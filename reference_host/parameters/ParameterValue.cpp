@@ -1,0 +1,55 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/parameters/ParameterValue.h"
+
+#include <cstring>
+
+#include "reference_host/framework/Guard.h"
+
+namespace host {
+
+NCFRESULT ParameterValue::Clear() {
+    number_.reset();
+    return NCF_OK;
+}
+
+NCFRESULT ParameterValue::SetData(const GUID& type, const void* data, ncfUInt32 bytes, ncfUInt32) {
+    if (data == nullptr) {
+        return NCF_E_POINTER;
+    }
+    if (type != kValueTypeUInt32) {
+        return NCF_E_NOTSUPPORTED;
+    }
+    ncfUInt32 number = 0;
+    if (bytes != sizeof number) {
+        return NCF_E_INVALIDARG;
+    }
+    std::memcpy(&number, data, sizeof number);
+    number_ = number;
+    return NCF_OK;
+}
+
+NCFRESULT ParameterValue::GetData(void* data, ncfUInt32 bytes) {
+    if (data == nullptr) {
+        return NCF_E_POINTER;
+    }
+    const ncfUInt32 number = number_.value_or(0);
+    if (bytes > (number_ ? sizeof number : 0)) {
+        return NCF_E_FAIL;
+    }
+    std::memcpy(data, &number, bytes);
+    return NCF_OK;
+}
+
+NCFRESULT ValueFactory::CreateValue(IParameterValue** out) {
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    *out = nullptr;
+    return Guarded([&] {
+        *out = MakeRef<ParameterValue>().Detach();
+        return NCF_OK;
+    });
+}
+
+}  // namespace host
