@@ -172,9 +172,14 @@ protected:
     // Field order and layout by the size of the picture alone.
     void ApplySizeBasedFieldDefault(ncfUInt32 width, ncfUInt32 height);
 
+    // The rectangles of a picture of this size and ratio, for movies that tell
+    // nothing of them.
+    void SetDefaultGeometry();
+
     // Tells why a track or picture is not native, to the logger under the
-    // function's name and to the console.
+    // function's name and to the console, which may get a line of its own.
     void TellReason(const char* function, const char* reason);
+    void TellReason(const char* function, const char* reason, const char* consoleLine);
 
     ncfSInt32 loaded_ = 0;
     NCFSmartPtr<INCFString> fileName_;

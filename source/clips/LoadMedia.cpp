@@ -6,17 +6,28 @@
 #include <cstring>
 
 #include "public_include/SimpleFileIO.h"
+#include "source/clips/OtherClip.h"
 #include "source/clips/QuickTimeClip.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace {
 
-// Where movies go whose headers the first route doesn't understand. There is
-// no second route yet: such a movie is refused, and `media` keeps the clip that
-// failed.
-NCFRESULT LoadMediaBySecondRoute(std::tr1::shared_ptr<BaseClip>&) {
-    return NMA_E_NOTINITIALIZED;
+// Where movies go whose headers the first route doesn't understand. `media`
+// keeps the clip of this route, also one that failed.
+NCFRESULT LoadMediaBySecondRoute(const char* function, NCFSmartPtr<INCFString> filePath,
+                                 NCFSmartPtr<INCFConsole> console,
+                                 NCFSmartPtr<INCFComponentFactory> componentFactory,
+                                 std::tr1::shared_ptr<BaseClip>& media) {
+    slog::Progress(function) << "FAILED!";
+    slog::Progress(function) << "try OtherMedia Container... ";
+    media.reset(new OtherClip(filePath, console, componentFactory));
+    if (media && !media->IsLoaded()) {
+        slog::Progress(function) << "FAILED!";
+        return NMA_E_NOTINITIALIZED;
+    }
+    slog::Progress(function) << "succeeded!";
+    return NCF_OK;
 }
 
 constexpr ncfUInt32 kBufLen = 512;
@@ -35,7 +46,7 @@ NCFRESULT LoadMedia(NCFSmartPtr<INCFString> filePath, NCFSmartPtr<INCFConsole> c
     slog::Progress(ncfFunction) << "try QT Container... ";
     media.reset(new QuickTimeClip(filePath, console, componentFactory));
     if (media && !media->IsLoaded()) {
-        return LoadMediaBySecondRoute(media);
+        return LoadMediaBySecondRoute(ncfFunction, filePath, console, componentFactory, media);
     }
     slog::Progress(ncfFunction) << "succeeded!";
     return NCF_OK;

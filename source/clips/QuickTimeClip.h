@@ -120,7 +120,6 @@ private:
     NCFRESULT ReadColorSpaceDescriptor();
     NCFRESULT SetGeometryImplFromSpecificMedia();
     NCFRESULT ReadBounds();
-    void SetDefaultGeometry();
 
     NCFRESULT GatherTracks(std::vector<NCFSmartPtr<ITrackInfo>>& tracks);
 

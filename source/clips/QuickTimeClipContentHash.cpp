@@ -7,55 +7,16 @@
 
 #include <algorithm>
 
-#include "public_include/SimpleFileIO.h"
+#include "source/clips/HashContent.h"
 #include "source/clips/QuickTimeClip.h"
 #include "source/plugin/ResultChecks.h"
-#include "source/plugin/os/Os.h"
 
 namespace {
 
-constexpr ncfUInt64 maxChunkSize = 1048576;
-
-// Largest range that one read can fetch.
-constexpr ncfUInt64 kLargestRead = 0xFFFFFFFF;
-
-NCFRESULT ReadWhole(const char* ncfFunction, NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset,
-                    ncfUInt32 size, ncfUInt8* bytes) {
-    ncfUInt32 actualRead = 0;
-    NCF_RETURN_TEXT("file_reader.Read(offset, &local[0], size, &actualRead)",
-                    file_reader.Read(offset, bytes, size, &actualRead));
-    return actualRead == size ? NCF_OK : NCF_E_FAIL;
-}
-
-// How much of the content is good, however the reading ends.
-struct Kept {
-    std::vector<ncfUInt8>& content;
-    std::size_t size;
-
-    ~Kept() { content.resize(size); }
-};
-
-// Reads a range behind what `content` holds; a range that the file can't fill
-// is refused and leaves nothing behind. An empty one adds nothing.
-NCFRESULT AppendRange(const char* ncfFunction, NMA::Impl::SimpleFileIO& file_reader,
-                      ncfUInt64 offset, ncfUInt64 size, std::vector<ncfUInt8>& content) {
-    if (size == 0) {
-        return NCF_OK;
-    }
-    if (size > kLargestRead) {
-        return NCF_E_FAIL;
-    }
-    const auto wanted = static_cast<ncfUInt32>(size);
-    Kept kept{content, content.size()};
-    content.reserve(kept.size + wanted);
-    os::ExpectLargeBlock(content.data() + kept.size, wanted);
-    content.resize(kept.size + wanted);
-    const NCFRESULT result =
-        ReadWhole(ncfFunction, file_reader, offset, wanted, &content[kept.size]);
-    if (result >= 0) {
-        kept.size = content.size();
-    }
-    return result;
+NCFRESULT AppendRange(const char* function, NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset,
+                      ncfUInt64 size, std::vector<ncfUInt8>& content) {
+    return AppendFileRange(function, "file_reader.Read(offset, &local[0], size, &actualRead)",
+                           file_reader, offset, size, content);
 }
 
 }  // namespace
@@ -92,7 +53,7 @@ NCFRESULT QuickTimeClip::GetContentForHash(std::vector<ncfUInt8>& content) {
             continue;
         }
         NCF_RETURN(pTable->GetChunkFromTheMiddle(&offset, &size));
-        size = std::min(size, maxChunkSize);
+        size = std::min(size, kHashChunkSize);
         ncfUInt64 streamLength = 0;
         NCF_RETURN(file_reader.GetLength(&streamLength));
         if (offset > streamLength || size > streamLength - offset) {

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The four rectangles of the picture: from the movie's raster text, or else
-// worked out of size and ratio.
+// those of any picture of its size and ratio.
 
 #include <string>
 
@@ -14,34 +14,6 @@
 namespace {
 
 constexpr char kBoundsTag[] = "<Bounds>";
-
-// Products wrap at 32 bits, as the numbers of the description do.
-ncfSInt32 Wrapped(ncfSInt32 a, ncfSInt32 b) {
-    return static_cast<ncfSInt32>(static_cast<ncfUInt32>(a) * static_cast<ncfUInt32>(b));
-}
-
-ncfSInt32 Negated(ncfSInt32 a) {
-    return static_cast<ncfSInt32>(0u - static_cast<ncfUInt32>(a));
-}
-
-// Whole numbers lose their denominator; nothing else is reduced.
-Rational Simplified(ncfSInt32 numerator, ncfSInt32 denominator) {
-    if (denominator != 0 && denominator != -1 && numerator % denominator == 0) {
-        return Rational{numerator / denominator, 1};
-    }
-    return Rational{numerator, denominator};
-}
-
-// Within 15 per cent of the area of a standard-definition raster.
-bool IsNearStandardRaster(ncfUInt32 w, ncfUInt32 h) {
-    const double v = 1.0 * w * h / (h < 487 ? 345600.0 : 414720.0);
-    return 0.85 < v && v < 1.15;
-}
-
-bool IsHighDefinitionRaster(ncfUInt32 w, ncfUInt32 h) {
-    return (w == 1920 && h == 1080) || (w == 1280 && h == 720) ||
-           (h == 1080 && (w == 1440 || w == 1280));
-}
 
 }  // namespace
 
@@ -98,35 +70,4 @@ NCFRESULT QuickTimeClip::ReadBounds() {
         }
     }
     return NCF_OK;
-}
-
-// One rectangle for all four, centred on the origin. Standard rasters are
-// scaled to the width that their ratio has in square pixels.
-void QuickTimeClip::SetDefaultGeometry() {
-    const ncfUInt32 w = isRotated_ ? height_ : width_;
-    const ncfUInt32 h = isRotated_ ? width_ : height_;
-    const auto an = static_cast<ncfSInt32>(imageAspectRatioNumerator_);
-    const auto ad = static_cast<ncfSInt32>(imageAspectRatioDenominator_);
-    ncfSInt32 scale = 1;
-    ncfSInt32 div = 1;
-    if (an == 4 && ad == 3) {
-        if (IsNearStandardRaster(w, h)) {
-            scale = 1440;
-            div = static_cast<ncfSInt32>(w);
-        }
-    } else if (an == 16 && ad == 9) {
-        if (IsHighDefinitionRaster(w, h)) {
-            scale = 1920;
-            div = static_cast<ncfSInt32>(w);
-        } else if (IsNearStandardRaster(w, h)) {
-            scale = 1920;
-            div = 720;
-        }
-    }
-    BoundsBox box;
-    box.width = Simplified(Wrapped(Wrapped(static_cast<ncfSInt32>(w), scale), 5), Wrapped(div, 6));
-    box.height = Simplified(Wrapped(box.width.numerator, ad), Wrapped(box.width.denominator, an));
-    box.positionY = Simplified(Negated(box.height.numerator), Wrapped(box.height.denominator, 2));
-    box.positionX = Simplified(Negated(box.width.numerator), Wrapped(box.width.denominator, 2));
-    geometryDetails_ = GeometryDetails{box, box, box, box};
 }

@@ -22,8 +22,12 @@ constexpr NCFRESULT kSampleProvider = 0;
 }  // namespace
 
 void BaseClip::TellReason(const char* function, const char* reason) {
+    TellReason(function, reason, reason);
+}
+
+void BaseClip::TellReason(const char* function, const char* reason, const char* consoleLine) {
     slog::Progress(function) << reason;
-    console_->Write(2, "%s", reason);
+    console_->Write(2, "%s", consoleLine);
 }
 
 NCFRESULT BaseClip::CommonSampleProviderCheck() {

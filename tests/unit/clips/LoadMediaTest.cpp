@@ -3,7 +3,7 @@
 
 #include "source/clips/LoadMedia.h"
 
-#include "tests/unit/clips/ClipFixture.h"
+#include "tests/unit/clips/OtherClipFixture.h"
 
 namespace {
 
@@ -67,7 +67,7 @@ protected:
     ~SlashesOfAStubbornString() override { path = nullptr; }
 };
 
-class LoadMediaTest : public ClipTest {
+class LoadMediaTest : public OtherClipTest {
 protected:
     NCFRESULT Ask(const std::string& path) {
         return LoadMedia(HostText(path), NCFSmartPtr<INCFConsole>(&host->console()),
@@ -114,17 +114,75 @@ TEST_F(LoadMediaTest, RefusesANullPathAndLeavesTheClip) {
     EXPECT_EQ(log->count("CHK_INARG(filePath.inArg())LoadMedia"), 1);
 }
 
-TEST_F(LoadMediaTest, KeepsTheClipThatFailed) {
+TEST_F(LoadMediaTest, TriesTheWrapperWhenTheHeadersAreRefused) {
     parser->script = {{NCF_E_FAIL, 0, 0}};
+    wrapper->AddPicture(1);
+    EXPECT_EQ(Ask(file.path()), NCF_OK);
+    ASSERT_TRUE(media);
+    EXPECT_TRUE(media->IsLoaded());
+    EXPECT_NE(dynamic_cast<OtherClip*>(media.get()), nullptr);
+    EXPECT_EQ(wrapper->openedPath, file.path());
+    std::vector<std::string> progress;
+    for (const LoggedRecord& record : log->records()) {
+        if (record.where == "LoadMedia") {
+            progress.push_back(record.text);
+        }
+    }
+    EXPECT_EQ(progress, (std::vector<std::string>{
+                            "LoadMediatry QT Container... ", "LoadMediaFAILED!",
+                            "LoadMediatry OtherMedia Container... ", "LoadMediasucceeded!"}));
+    EXPECT_EQ(host->console().lines().size(), 2u) << "fields and colour";
+}
+
+TEST_F(LoadMediaTest, TriesTheWrapperWhenThePictureCannotBeRead) {
+    parser->AddVideoTrack(1);
+    Picture().results["GetFieldInfo"] = NCF_E_FAIL;
+    wrapper->AddPicture(1);
+    EXPECT_EQ(Ask(file.path()), NCF_OK);
+    EXPECT_NE(dynamic_cast<OtherClip*>(media.get()), nullptr);
+}
+
+TEST_F(LoadMediaTest, LeavesTheWrapperAloneWhenTheHeadersDo) {
+    parser->AddVideoTrack(1);
+    EXPECT_EQ(Ask(file.path()), NCF_OK);
+    EXPECT_EQ(host->creations(QTWrapper::CompID_QuickTimeWrapper), 0);
+}
+
+TEST_F(LoadMediaTest, KeepsTheClipThatFailedLast) {
+    parser->script = {{NCF_E_FAIL, 0, 0}};
+    wrapper->results["NewMovieFromFilePath"] = NCF_E_FAIL;
     EXPECT_EQ(Ask(file.path()), NMA_E_NOTINITIALIZED);
     ASSERT_TRUE(media);
     EXPECT_FALSE(media->IsLoaded());
+    EXPECT_NE(dynamic_cast<OtherClip*>(media.get()), nullptr);
+    EXPECT_EQ(log->records().back().text, "LoadMediaFAILED!");
+    EXPECT_EQ(log->count("LoadMediaFAILED!"), 2);
+    EXPECT_EQ(log->count("LoadMediasucceeded!"), 0);
 }
 
-TEST_F(LoadMediaTest, HidesThePreciseFailureOfTheFirstRoute) {
+TEST_F(LoadMediaTest, ReleasesTheClipOfTheFirstRoute) {
+    parser->script = {{NCF_E_FAIL, 0, 0}};
+    wrapper->AddSound(1);
+    EXPECT_EQ(Ask(file.path()), NCF_OK);
+    EXPECT_EQ(parser->references(), 1u) << "the test's own";
+}
+
+TEST_F(LoadMediaTest, HidesThePreciseFailuresOfBothRoutes) {
+    host->refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_OUTOFMEMORY);
+    parser->script = {{NCF_E_ABORT, 0, 0}};
+    EXPECT_EQ(Ask(file.path()), NMA_E_NOTINITIALIZED);
+}
+
+TEST_F(LoadMediaTest, TellsTheConsoleOfAMovieWithoutPictureAndSoundOnEachRoute) {
     parser->AddTimecodeTrack(1);
     EXPECT_EQ(Ask(file.path()), NMA_E_NOTINITIALIZED);
-    EXPECT_EQ(Console(1, "Movie doesn't contain any video/audio tracks!\n"), 1);
+    EXPECT_EQ(Console(1, "Movie doesn't contain any video/audio tracks!\n"), 2);
+}
+
+TEST_F(LoadMediaTest, NeverTriesTheWrapperOnAFileThatCannotBeOpened) {
+    RecordingNMALog lines(1);
+    EXPECT_THROW(Ask(testing::TempDir() + "no_such_movie.mov"), NCFRESULT);
+    EXPECT_EQ(host->creations(QTWrapper::CompID_QuickTimeWrapper), 0);
 }
 
 TEST_F(LoadMediaTest, LetsAFileThatCannotBeOpenedThrow) {

@@ -6,36 +6,8 @@
 
 #include "source/clips/SampleProviderPolicy.h"
 
-#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "tests/unit/clips/ClipFixture.h"
-
-namespace {
-
-// What the retriever stands for in this program.
-struct RetrieverDouble {
-    bool exists = true;
-    NCFRESULT result = NCF_OK;
-    const BaseClip* asked = nullptr;
-    AAFInfo* record = nullptr;
-};
-RetrieverDouble retriever;
-
-alignas(QuickTimeToAAFInfoRetriever) unsigned char place[sizeof(QuickTimeToAAFInfoRetriever)];
-
-}  // namespace
-
-QuickTimeToAAFInfoRetriever* QuickTimeToAAFInfoRetriever::GetInstance() {
-    return retriever.exists ? reinterpret_cast<QuickTimeToAAFInfoRetriever*>(place) : nullptr;
-}
-
-NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const BaseClip* media,
-                                                                   AAFInfo* aafInfo,
-                                                                   ncfUInt32* vcid) {
-    retriever.asked = media;
-    retriever.record = aafInfo;
-    *vcid = 4711;
-    return retriever.result;
-}
+#include "tests/unit/clips/retriever_double/RetrieverDouble.h"
 
 namespace {
 

@@ -1,0 +1,14 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
+
+// What the retriever stands for in this program: it answers as the test says.
+struct RetrieverDouble {
+    bool exists = true;
+    NCFRESULT result = NCF_OK;
+    const BaseClip* asked = nullptr;
+    AAFInfo* record = nullptr;
+};
+extern RetrieverDouble retriever;
