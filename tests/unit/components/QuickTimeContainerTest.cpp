@@ -367,6 +367,7 @@ TEST_F(Container, HasNoSampleMappingBeforeItsPath) {
     auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
     EXPECT_EQ(container()->GetSampleMapping(&mapping), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(mapping, nullptr);
+    EXPECT_EQ(container()->GetSampleMapping(nullptr), NMA_E_NOTINITIALIZED);
 }
 
 TEST_F(Container, MakesAMappingOverItsClipAtEachRequest) {
@@ -451,15 +452,25 @@ TEST_F(Container, TellsTheUserOfAMappingThatIsNotTheModulesOwn) {
     });
     refused();
     EXPECT_EQ(LiveFakes(), 2) << "host and console: what was made is released";
+    EXPECT_EQ(host.creations(NCFCompID_QTParser), 0) << "the movie is opened after that";
 }
 
 TEST_F(Container, MappingOfAFileThatIsNoMovieFailsAndLeavesNothing) {
+    RecordingLog log(host);
     serveMappings();
     const auto object = container();
     object->SetFilePath(path(write("a.mov", "no movie")).inArg());
     auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
     EXPECT_EQ(object->GetSampleMapping(&mapping), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(mapping, nullptr);
+    EXPECT_EQ(log.count("NCF_RETURN(0xa0000068): LoadMedia(filePath_, console_, "
+                        "componentFactory_, media_) : "
+                        "NMA::Impl::QuickTimeContainer::GetSampleMapping"),
+              1);
+    // The clip that failed is kept, so the next mapping stands over that one.
+    ASSERT_EQ(object->GetSampleMapping(&mapping), NCF_OK);
+    EXPECT_EQ(host.creations(NCFCompID_QTParser), 1);
+    mapping->Release();
     const auto absent = container();
     absent->SetFilePath(path(folder / "absent.mov").inArg());
     mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);

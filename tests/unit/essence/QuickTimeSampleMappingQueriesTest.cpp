@@ -81,6 +81,23 @@ TEST_F(SampleQueries, ChannelsNeedTheWrapper) {
               1);
 }
 
+// Behind a second picture the list of tracks has the sound one place later than
+// the map.
+TEST_F(SampleQueries, ChannelsBehindASecondPictureFollowTheListAndNotTheMap) {
+    AddVideo(9);
+    mapping->_mediaTracks.clear();
+    mapping->_trackRemapVect.clear();
+    Bind();
+    ncfUInt32 channels = 9;
+    EXPECT_EQ(interface->GetNumberOfChannels(1, &channels), NCF_OK);
+    EXPECT_EQ(channels, 1u) << "the second picture";
+    channels = 9;
+    EXPECT_EQ(interface->GetNumberOfChannels(2, &channels), NCF_E_FAIL);
+    EXPECT_EQ(channels, 1u);
+    EXPECT_EQ(log->count(Record("80000008", unmapped, "GetNumberOfChannels")), 1);
+    EXPECT_EQ(journal.count("wrapper.GetAudioInfoForTrack"), 0);
+}
+
 // --- what every operation checks ---------------------------------------------------------
 
 TEST_F(SampleQueries, EveryOutputIsNeeded) {
@@ -116,6 +133,30 @@ TEST_F(SampleQueries, EveryOutputIsNeeded) {
             log->count(Check(std::string("CHK_INARG(") + check.argument + ")", check.operation)), 1)
             << check.operation << " " << check.argument;
     }
+}
+
+TEST_F(SampleQueries, OutputIsAskedForBeforeTheTrack) {
+    ncfUInt64 flags = 0;
+    for (const NCFRESULT result :
+         {interface->GetNumberOfSamples(2, nullptr), interface->GetSampleSize(2, 0, nullptr),
+          interface->GetSamplePosition(2, 0, nullptr),
+          interface->GetSampleTemporalOffset(2, 0, nullptr),
+          interface->GetSampleProperties(2, 0, &flags, nullptr),
+          interface->GetNumberOfContiguousSamples(2, 0, nullptr),
+          interface->GetNumberOfContiguousBytes(2, 0, nullptr)}) {
+        EXPECT_EQ(result, NCF_E_INVALIDARG);
+    }
+    EXPECT_EQ(interface->GetNumberOfChannels(2, nullptr), NCF_E_POINTER);
+    EXPECT_TRUE(host->console().lines().empty()) << "the map was not asked";
+}
+
+TEST_F(SampleQueries, NoClipIsTheMapsFailure) {
+    mapping->media_.reset();
+    ncfUInt64 out = 77;
+    EXPECT_EQ(interface->GetNumberOfSamples(1, &out), NCF_E_POINTER);
+    EXPECT_EQ(out, 77u);
+    EXPECT_EQ(log->count(Check("CHK_PTR(media_)", "AAFTrackToQuickTimeTrack")), 1);
+    EXPECT_EQ(log->count(Record("80000005", unmapped, "GetNumberOfSamples")), 1);
 }
 
 TEST_F(SampleQueries, UnmappedTrackFailsInTheMap) {
@@ -295,6 +336,7 @@ TEST_F(SampleQueries, RunThatEndsBeforeTheSampleIsUnexpected) {
     ncfUInt64 bytes = 77;
     Sound().next = 3;
     EXPECT_EQ(interface->GetNumberOfContiguousSamples(1, 4, &run), NCF_E_UNEXPECTED);
+    EXPECT_EQ(run, -2) << "the count is out before the end is looked at";
     EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 4, &bytes), NCF_E_UNEXPECTED);
     EXPECT_EQ(bytes, 77u);
     EXPECT_TRUE(log->records().empty());
@@ -304,6 +346,9 @@ TEST_F(SampleQueries, EndIsComparedWithASign) {
     ncfSInt64 run = 77;
     Sound().next = 0xFFFFFFFFFFFFFFFF;  // -1, below every sample
     EXPECT_EQ(interface->GetNumberOfContiguousSamples(1, 0, &run), NCF_E_UNEXPECTED);
+    ncfUInt64 bytes = 77;
+    EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 0, &bytes), NCF_E_UNEXPECTED);
+    EXPECT_EQ(bytes, 77u);
 }
 
 TEST_F(SampleQueries, FailedWalkGivesOneSampleAtTheStartAndNoneLater) {
@@ -321,6 +366,18 @@ TEST_F(SampleQueries, FailedWalkGivesOneSampleAtTheStartAndNoneLater) {
                                 "1, &lastSample)",
                                 "GetNumberOfContiguousBytes")),
               1);
+}
+
+TEST_F(SampleQueries, FailedWalkThatToldAnEndIsStillOneSampleAndComparedWithIt) {
+    ncfSInt64 run = 77;
+    Sound().next = 8;
+    for (const NCFRESULT answer : {NCF_E_ABORT, NCFRESULT{1}}) {
+        Sound().nextResult = answer;
+        EXPECT_EQ(interface->GetNumberOfContiguousSamples(1, 2, &run), NCF_OK);
+        EXPECT_EQ(run, 1) << "only zero counts as found";
+        EXPECT_EQ(interface->GetNumberOfContiguousSamples(1, 9, &run), NCF_E_UNEXPECTED);
+        EXPECT_EQ(run, 1);
+    }
 }
 
 TEST_F(SampleQueries, WalkThatSucceedsWithoutAnEndGivesNone) {
@@ -371,11 +428,32 @@ TEST_F(SampleQueries, BytesNarrowTheLastSample) {
     EXPECT_EQ(journal.lines()[3], "clip.GetDataSizePerSample 8 5");
 }
 
+TEST_F(SampleQueries, BytesOfARunThatEndsAtTheSampleAreCountedBackwards) {
+    Sound().next = 4;
+    ncfUInt64 bytes = 0;
+    EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 4, &bytes), NCF_OK);
+    // From sample 5 of the clip at 10000 back to sample 3 at 8000, 103 long.
+    EXPECT_EQ(static_cast<ncfSInt64>(bytes), -1897);
+    // An end of zero is not below sample 0 either.
+    Sound().next = 0;
+    journal.clear();
+    EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 0, &bytes), NCF_OK);
+    EXPECT_EQ(journal.lines(),
+              (Lines{"clip.GetNextDiscontiguousDataAttributeChange 8 1", "clip.GetDataOffset 8 1",
+                     "clip.GetDataOffset 8 -1", "clip.GetDataSizePerSample 8 -1"}));
+}
+
 TEST_F(SampleQueries, BytesGiveTheFailureOfEachCall) {
     Sound().next = 6;
     ncfUInt64 bytes = 77;
     clip->results = {{"GetDataOffset", NCF_E_ABORT}};
     EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 1, &bytes), NCF_E_ABORT);
+    clip->results = {{"GetDataOffset 8 5", NCF_E_NOTFOUND}};
+    EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 1, &bytes), NCF_E_NOTFOUND);
+    EXPECT_EQ(log->count(Record("8000000c",
+                                "media_->GetDataOffset(trackQT, lastSample - 1, &lastPosition)",
+                                "GetNumberOfContiguousBytes")),
+              1);
     clip->results = {{"GetDataSizePerSample", NCF_E_HANDLE}};
     EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 1, &bytes), NCF_E_HANDLE);
     EXPECT_EQ(bytes, 77u);
@@ -416,7 +494,31 @@ TEST_F(SampleQueries, UnitsAnswerAsSamplesDo) {
     ncfSInt64 run = 0;
     EXPECT_EQ(interface->GetNumberOfContiguousEncodedUnits(1, 2, &run), NCF_OK);
     EXPECT_EQ(run, 5);
+    RecordingNMALog lines;
     EXPECT_EQ(interface->GetEncodedUnitStride(1, 2, &out), NCF_E_NOTIMPL);
+    ASSERT_EQ(lines.lines().size(), 1u);
+    EXPECT_EQ(lines.lines()[0].text, "QuickTimeSampleMapping::GetSampleStride: Not Implemented");
+}
+
+// A mapping with sample operations of its own.
+struct OwnSamples final : NMA::Impl::QuickTimeSampleMapping {
+    using QuickTimeSampleMapping::QuickTimeSampleMapping;
+    NCFRESULT GetNumberOfSamples(ncfUInt32, ncfUInt64*) override { return 101; }
+    NCFRESULT GetSampleStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return 102; }
+    NCFRESULT GetSamplePosition(ncfUInt32, ncfUInt64, ncfUInt64*) override { return 103; }
+    NCFRESULT GetSampleSize(ncfUInt32, ncfUInt64, ncfUInt64*) override { return 104; }
+    NCFRESULT GetNumberOfContiguousSamples(ncfUInt32, ncfUInt64, ncfSInt64*) override {
+        return 105;
+    }
+};
+
+TEST_F(SampleQueries, UnitsGoThroughTheInterface) {
+    OwnSamples own(nullptr);
+    EXPECT_EQ(own.GetNumberOfEncodedUnits(0, nullptr), 101);
+    EXPECT_EQ(own.GetEncodedUnitStride(0, 0, nullptr), 102);
+    EXPECT_EQ(own.GetEncodedUnitPosition(0, 0, nullptr), 103);
+    EXPECT_EQ(own.GetEncodedUnitSize(0, 0, nullptr), 104);
+    EXPECT_EQ(own.GetNumberOfContiguousEncodedUnits(0, 0, nullptr), 105);
 }
 
 // --- refused --------------------------------------------------------------------------------

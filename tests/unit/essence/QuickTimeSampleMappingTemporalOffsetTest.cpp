@@ -119,7 +119,6 @@ TEST_F(TemporalOffset, SampleWithoutDurationFailsWhereItWouldDivide) {
     journal.clear();
     EXPECT_EQ(Ask(1), NCF_OK) << "in its place: nothing is divided";
     EXPECT_EQ(offset, 0);
-    Samples({0, 500}, 0);
 }
 
 TEST_F(TemporalOffset, SampleWithoutDurationFailsOnTheWayBackToo) {
@@ -164,6 +163,43 @@ TEST_F(TemporalOffset, GivesTheFailureOfEachCall) {
         EXPECT_EQ(log->count(Record("80000007", call.second, "GetSampleTemporalOffset")), 1)
             << call.first;
     }
+}
+
+TEST_F(TemporalOffset, FailureOfAProbeEndsTheSearch) {
+    Samples({0, 5000, 0, -1000});
+    clip->results = {{"GetDisplayOffset 7 3", NCF_E_ABORT}};
+    EXPECT_EQ(Ask(1), NCF_E_ABORT) << "the way forward";
+    EXPECT_EQ(Probes(), Lines{"3"});
+    EXPECT_EQ(log->count(Record("80000007",
+                                "media_->GetDisplayOffset(trackQT, sample + 1 + curPos, &qtOffset)",
+                                "GetSampleTemporalOffset")),
+              1);
+    journal.clear();
+    clip->results = {{"GetDisplayOffset 7 1", NCF_E_HANDLE}};
+    EXPECT_EQ(Ask(1), NCF_E_HANDLE) << "the way back";
+    EXPECT_EQ(Probes(), (Lines{"3", "1"}));
+    EXPECT_EQ(offset, 77);
+}
+
+TEST_F(TemporalOffset, FailureOfAProbeComesBeforeThatOfTheDivision) {
+    Samples({500, 0}, 0);
+    clip->results = {{"GetDisplayOffset 7 2", NCF_E_ABORT}};
+    EXPECT_EQ(Ask(0), NCF_E_ABORT);
+}
+
+TEST_F(TemporalOffset, DistanceIsComparedInFullWidth) {
+    const ncfSInt64 turn = ncfSInt64{1} << 32;
+    Samples({5, turn + 1, 5, -turn - 1, 5}, 1);
+    EXPECT_EQ(Ask(2), NCF_E_FAIL) << "neighbours a whole turn away are no partners";
+}
+
+TEST_F(TemporalOffset, TenthIsRoundedDown) {
+    Samples({100, 101, 0}, 1009);
+    EXPECT_EQ(Ask(0), NCF_OK);
+    EXPECT_EQ(offset, 0);
+    journal.clear();
+    Ask(1);
+    EXPECT_FALSE(Probes().empty());
 }
 
 TEST_F(TemporalOffset, PastTheLastSampleIsTheClipsFailure) {

@@ -4,6 +4,7 @@
 #include "host_interfaces/header_parser/QTParser.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/parameters/ParametersXML.h"
+#include "tests/unit/aaf/support/StubbornString.h"
 #include "tests/unit/essence/support/MappingFixture.h"
 
 namespace {
@@ -241,6 +242,26 @@ TEST_F(SampleMapping, QueriesWithoutPathOrClipFailAndStillGiveAReference) {
         2);
 }
 
+TEST_F(SampleMapping, LoadsTheClipUnderTheLockForPicturesAlone) {
+    NCFSmartPtr<INCFString> path;
+    path.attach(MakeHostString("/no/such/movie.mov"));
+    ASSERT_EQ(mapping->SetFilePath(path), NCF_OK);
+    int loads = 0;
+    int depth = 1;
+    host->maker(NCFCompID_QTParser, [&](const GUID&, void**) {
+        ++loads;
+        EXPECT_EQ(lock->depth(), depth);
+        return NCF_E_FAIL;
+    });
+    EXPECT_LT(Query(NMA::IID_IUncompressedImageProvider), 0);
+    depth = 0;
+    for (const GUID& iid : {NMA::IID_IUncompressedAudioProvider, IID_INCFParametersXML}) {
+        mapping->media_.reset();
+        EXPECT_LT(Query(iid), 0);
+    }
+    EXPECT_EQ(loads, 3);
+}
+
 // --- the audio query -----------------------------------------------------------------------
 
 TEST_F(SampleMapping, TakesTheSoundReaderAtTheFirstAudioQueryWithoutTheLock) {
@@ -285,6 +306,13 @@ TEST_F(SampleMapping, TurnsTheCallersPathToUTF16) {
     ASSERT_EQ(path->ConvertTo(kNCFUTF8), NCF_OK);
     EXPECT_EQ(mapping->SetFilePath(path), NCF_OK);
     EXPECT_EQ(path->GetEncoding(), kNCFUTF16);
+}
+
+TEST_F(SampleMapping, GivesTheFailureToTurnThePath) {
+    NCFSmartPtr<INCFString> path;
+    path.attach(new StubbornString("/movies/a.mov", "ConvertTo", NCF_E_ABORT));
+    EXPECT_EQ(mapping->SetFilePath(path), NCF_E_ABORT);
+    EXPECT_EQ(log->count(Record("80000007", "_filePath->ConvertTo(kNCFUTF16)", "SetFilePath")), 1);
 }
 
 TEST_F(SampleMapping, RefusesANullClip) {
@@ -339,6 +367,40 @@ TEST_F(SampleMapping, GivesTheFailureOfStartingAndStopping) {
               1);
 }
 
+TEST_F(SampleMapping, StartsAndStopsForTheAlphaTrackToo) {
+    AddVideo(1);
+    clip->setAlpha(true);
+    property->codes = {QuickTime::kBGRAPixelFormat};
+    Bind();
+    ASSERT_EQ(QueryImages(), NCF_OK);
+    ASSERT_EQ(mapping->SetWorkingImageFormat(0, 0), NCF_OK);
+    journal.clear();
+    EXPECT_EQ(mapping->Setup(1), NCF_OK);
+    EXPECT_EQ(mapping->Cleanup(1), NCF_OK);
+    EXPECT_EQ(journal.lines(), (Lines{"reader.InitQT", "reader.ReleaseQT"}));
+}
+
+TEST_F(SampleMapping, StartingWithoutAClipLoadsItFirstAndStoppingNeedsNone) {
+    AddVideo(1);
+    Bind();
+    ASSERT_EQ(QueryImages(), NCF_OK);
+    ASSERT_EQ(mapping->SetWorkingImageFormat(0, 0), NCF_OK);
+    NCFSmartPtr<INCFString> path;
+    path.attach(MakeHostString("/no/such/movie.mov"));
+    ASSERT_EQ(mapping->SetFilePath(path), NCF_OK);
+    mapping->media_.reset();
+    journal.clear();
+    EXPECT_EQ(mapping->Cleanup(0), NCF_OK);
+    EXPECT_EQ(host->creations(NCFCompID_QTParser), 0);
+    EXPECT_EQ(mapping->Setup(0), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(journal.count("reader.InitQT"), 0);
+    EXPECT_EQ(
+        log->count(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
+                          "SetupOrCleanup")),
+        1);
+    EXPECT_EQ(mapping->Setup(0), NCF_OK) << "the clip that failed is kept";
+}
+
 TEST_F(SampleMapping, SetupAndCleanupTouchNothingOfASoundTrack) {
     AddVideo(1);
     AddAudio(2);
@@ -374,8 +436,7 @@ TEST_F(SampleMapping, RefusesThreeOperationsSilentlyAndDoesNothingInFour) {
     EXPECT_TRUE(lines.lines().empty());
 }
 
-// --- after a change of the parameters
-// ---------------------------------------------------------------
+// --- after a change of the parameters ---------------------------------------------------------
 
 TEST_F(SampleMapping, RefreshAddsFormatsThenLetsTheClipWorkOutItsFieldsUnderTheLock) {
     AddVideo(1);

@@ -23,7 +23,8 @@ struct EssenceTrack {
 };
 
 // A clip that answers what a test sets: writes "clip.<operation> <arguments>"
-// into the journal and fails the operations named in `results`.
+// into the journal and fails the operations named in `results`, or single calls
+// of them.
 class EssenceClip final : public BaseClip, public FakeCalls {
 public:
     EssenceClip(FakeHost& host, Journal* lines)
@@ -130,9 +131,7 @@ public:
                                                       ncfUInt64* out) override {
         const EssenceTrack& track = trackOf(qtTrack);
         note("GetNextDiscontiguousDataAttributeChange", qtTrack, sample);
-        if (track.nextResult >= 0) {
-            *out = track.next;
-        }
+        *out = track.next;  // also where it fails, as a wrapper may
         return track.nextResult;
     }
     NCFRESULT GetDataSizePerSample(ncfUInt32 qtTrack, ncfUInt64 sample, ncfUInt32* out) override {
@@ -144,7 +143,7 @@ public:
         if (sample < 1 || sample > offsets.size()) {
             return NCF_E_INVALIDARG;
         }
-        const NCFRESULT result = resultOf("GetDisplayOffset");
+        const NCFRESULT result = resultOf("GetDisplayOffset", qtTrack, sample);
         if (result >= 0) {
             *out = offsets[sample - 1];
         }
@@ -210,15 +209,23 @@ private:
         const auto found = results.find(operation);
         return found == results.end() ? NCF_OK : found->second;
     }
+    // "GetDataOffset 8 5" fails for that sample alone.
+    NCFRESULT resultOf(const std::string& operation, ncfUInt32 qtTrack, ncfUInt64 sample) const {
+        const auto found = results.find(Call(operation, qtTrack, sample));
+        return found == results.end() ? resultOf(operation) : found->second;
+    }
     void note(const std::string& operation, ncfUInt32 qtTrack, ncfUInt64 sample) {
-        journal->add("clip." + operation + " " + std::to_string(qtTrack) + " " +
-                     std::to_string(static_cast<ncfSInt64>(sample)));
+        journal->add("clip." + Call(operation, qtTrack, sample));
+    }
+    static std::string Call(const std::string& operation, ncfUInt32 qtTrack, ncfUInt64 sample) {
+        return operation + " " + std::to_string(qtTrack) + " " +
+               std::to_string(static_cast<ncfSInt64>(sample));
     }
     template <class Out, class Value>
     NCFRESULT ask(const std::string& operation, ncfUInt32 qtTrack, ncfUInt64 sample, Out* out,
                   const Value& value) {
         note(operation, qtTrack, sample);
-        const NCFRESULT result = resultOf(operation);
+        const NCFRESULT result = resultOf(operation, qtTrack, sample);
         if (result >= 0) {
             *out = static_cast<Out>(value);
         }
