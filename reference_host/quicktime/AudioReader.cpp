@@ -13,7 +13,7 @@ namespace host {
 namespace {
 
 // Long requests are served in pieces, so memory does not grow with them.
-constexpr ncfUInt64 kPieceFrames = 65536;
+constexpr std::size_t kPieceWords = 262144;
 
 }  // namespace
 
@@ -62,7 +62,8 @@ NCFRESULT AudioReader::ReadSamples(ncfUInt32 track, ncfUInt64 sample, ncfUInt64*
         ncfUInt64 reached = 0;
         bool isPastEnd = false;
         while (done < wanted && !isPastEnd) {
-            const ncfUInt64 piece = std::min(kPieceFrames, wanted - done);
+            const ncfUInt64 piece =
+                std::min<ncfUInt64>(std::max<std::size_t>(kPieceWords / wide, 1), wanted - done);
             const ncfUInt64 got = entry.decoder->Read(sample + done, piece, words_);
             StoreSoundWords(words_.data(), static_cast<std::size_t>(piece) * wide,
                             entry.bytesPerSample, entry.littleEndian, to);

@@ -15,7 +15,7 @@ namespace host {
 // Owners of the multimedia library's handles. None of its types leaves this
 // folder.
 struct CloseInput {
-    void operator()(AVFormatContext* context) const { avformat_close_input(&context); }
+    void operator()(AVFormatContext* context) const;  // and the file that it reads
 };
 using InputOwner = std::unique_ptr<AVFormatContext, CloseInput>;
 

@@ -131,46 +131,101 @@ std::string TextOf(ncfUInt32 code) {
     return text;
 }
 
-// The multimedia library's own long name, by the tags of movie files.
+ncfUInt32 Swapped(ncfUInt32 tag) {
+    return tag << 24 | (tag & 0xFF00u) << 8 | (tag >> 8 & 0xFF00u) | tag >> 24;
+}
+
+bool IsText(ncfUInt32 code) {
+    for (const int shift : {24, 16, 8, 0}) {
+        const ncfUInt32 c = code >> shift & 0xFF;
+        if (c < 0x20 || c > 0x7E) {
+            return false;
+        }
+    }
+    return true;
+}
+
+std::string LibraryName(AVCodecID codec) {
+    const AVCodecDescriptor* const descriptor = avcodec_descriptor_get(codec);
+    return !descriptor ? "" : descriptor->long_name ? descriptor->long_name : descriptor->name;
+}
+
+// The multimedia library's own long name, by the tags of movie files and of the
+// other family of files that has tags.
 std::string LibraryName(ncfUInt32 code) {
-    const AVCodecTag* const tables[] = {avformat_get_mov_video_tags(),
-                                        avformat_get_mov_audio_tags(), nullptr};
-    const unsigned tag = code << 24 | (code & 0xFF00u) << 8 | (code >> 8 & 0xFF00u) | code >> 24;
-    for (const AVCodecTag* const* table = tables; *table; ++table) {
-        const AVCodecTag* const one[] = {*table, nullptr};
-        const AVCodecDescriptor* const descriptor =
-            avcodec_descriptor_get(av_codec_get_id(one, tag));
-        if (descriptor) {
-            return descriptor->long_name ? descriptor->long_name : descriptor->name;
+    for (const AVCodecTag* const table :
+         {avformat_get_mov_video_tags(), avformat_get_mov_audio_tags(),
+          avformat_get_riff_video_tags()}) {
+        const AVCodecTag* const tables[] = {table, nullptr};
+        const std::string name = LibraryName(av_codec_get_id(tables, Swapped(code)));
+        if (!name.empty()) {
+            return name;
         }
     }
     return {};
 }
 
-}  // namespace
-
-NCFRESULT CodecName(ncfUInt32 code, std::string& name) {
+// By the rows above alone; empty for other codes.
+std::string OwnName(ncfUInt32 code) {
     const std::string text = TextOf(code);
-    for (const char c : text) {
-        if (c < 0x20 || c > 0x7E) {
-            return NCF_E_INVALIDARG;
-        }
-    }
-    name.clear();
     for (const Row& row : kNames) {
         if (text == row.code) {
-            name = row.name;
-            return NCF_OK;
+            return row.name;
         }
     }
     for (const FamilyRow& row : kFamilies) {
         if (text.compare(0, 3, row.start) == 0) {
-            name = row.name;
-            return NCF_OK;
+            return row.name;
         }
     }
-    name = LibraryName(code);
+    return {};
+}
+
+// Codecs with several codes in movies, each of which means something of its own.
+bool HasManyCodes(AVCodecID codec) {
+    return codec == AV_CODEC_ID_PRORES || codec == AV_CODEC_ID_DVVIDEO ||
+           codec == AV_CODEC_ID_RAWVIDEO;
+}
+
+ncfUInt32 CodeInMovies(const AVCodecParameters& form) {
+    const AVCodecTag* const tables[] = {form.codec_type == AVMEDIA_TYPE_AUDIO
+                                            ? avformat_get_mov_audio_tags()
+                                            : avformat_get_mov_video_tags(),
+                                        nullptr};
+    const ncfUInt32 code = Swapped(av_codec_get_tag(tables, form.codec_id));
+    return IsText(code) ? code : 0;
+}
+
+}  // namespace
+
+NCFRESULT CodecName(ncfUInt32 code, std::string& name) {
+    if (!IsText(code)) {
+        return NCF_E_INVALIDARG;
+    }
+    name = OwnName(code);
+    if (name.empty()) {
+        name = LibraryName(code);
+    }
     return NCF_OK;
+}
+
+ncfUInt32 CodecCode(const AVCodecParameters& form) {
+    const ncfUInt32 code = Swapped(form.codec_tag);
+    return IsText(code) ? code : CodeInMovies(form);
+}
+
+std::string CodecNameOf(const AVCodecParameters& form) {
+    std::string name = OwnName(Swapped(form.codec_tag));
+    if (name.empty() && !HasManyCodes(form.codec_id)) {
+        name = OwnName(CodeInMovies(form));
+    }
+    if (name.empty()) {
+        name = LibraryName(form.codec_id);
+    }
+    if (name.empty() && IsText(Swapped(form.codec_tag))) {
+        name = LibraryName(Swapped(form.codec_tag));
+    }
+    return name;
 }
 
 }  // namespace host

@@ -5,6 +5,7 @@
 #include <string>
 
 #include "host_interfaces/framework/ResultCodes.h"
+#include "reference_host/quicktime/AvOwners.h"
 
 namespace host {
 
@@ -13,5 +14,12 @@ namespace host {
 // well-formed code that nobody knows; NCF_E_INVALIDARG for code 0 and for codes
 // that are not printable.
 NCFRESULT CodecName(ncfUInt32 code, std::string& name);
+
+// The code of a stream's codec: its tag, or for a tag that is no text the code
+// that the codec has in movies. 0 for none.
+ncfUInt32 CodecCode(const AVCodecParameters& form);
+
+// A person's name for a stream's codec; empty only for codecs that nobody knows.
+std::string CodecNameOf(const AVCodecParameters& form);
 
 }  // namespace host

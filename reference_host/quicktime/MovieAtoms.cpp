@@ -3,6 +3,7 @@
 
 #include "reference_host/quicktime/MovieAtoms.h"
 
+#include <algorithm>
 #include <fstream>
 
 namespace host {
@@ -11,6 +12,7 @@ namespace {
 constexpr int kDeepest = 8;
 constexpr std::size_t kMostTracks = 65536;
 constexpr ncfUInt32 kMostReferences = 4096;
+constexpr std::size_t kMostDescriptionChanges = 65536;
 
 constexpr ncfUInt32 Code(const char (&text)[5]) {
     return static_cast<ncfUInt32>(static_cast<unsigned char>(text[0])) << 24 |
@@ -97,6 +99,9 @@ private:
             case Code("stsd"):
                 ReadDescriptions(position, end);
                 return;
+            case Code("stsc"):
+                ReadChunks(position, end);
+                return;
             case Code("dref"):
                 ReadReferences(position, end);
                 return;
@@ -139,6 +144,36 @@ private:
             const ncfUInt64 count = Number(bytes + 4, 4);
             out_.tracks.back().descriptionCount =
                 static_cast<ncfUInt32>(count < most ? count : most);
+        }
+    }
+
+    // Each entry: first chunk, samples of a chunk, description. Tracks of one
+    // description are left alone, for the table may be long.
+    void ReadChunks(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[12];
+        if (out_.tracks.empty() || out_.tracks.back().descriptionCount < 2 || end - position < 8 ||
+            !Read(position, bytes, 8)) {
+            return;
+        }
+        const ncfUInt64 most = (end - position - 8) / 12;
+        const ncfUInt64 count = std::min(Number(bytes + 4, 4), most);
+        std::vector<ncfUInt64>& changes = out_.tracks.back().descriptionChanges;
+        ncfUInt64 samples = 0, chunk = 1, perChunk = 0, description = 0;
+        for (ncfUInt64 i = 0; i < count && changes.size() < kMostDescriptionChanges &&
+                              Read(position + 8 + 12 * i, bytes, sizeof bytes);
+             ++i) {
+            const ncfUInt64 first = Number(bytes, 4);
+            if (first < chunk) {
+                return;
+            }
+            samples += (first - chunk) * perChunk;
+            const ncfUInt64 now = Number(bytes + 8, 4);
+            if (i > 0 && now != description) {
+                changes.push_back(samples);
+            }
+            chunk = first;
+            perChunk = Number(bytes + 4, 4);
+            description = now;
         }
     }
 

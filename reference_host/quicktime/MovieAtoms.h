@@ -17,6 +17,8 @@ struct MovieAtoms {
         ncfUInt32 id = 0;
         ncfUInt64 duration = 0;  // movie time units
         ncfUInt32 descriptionCount = 0;
+        // Samples, from 0, that have another description than the one before.
+        std::vector<ncfUInt64> descriptionChanges;
         bool needsOtherFiles = false;
     };
     ncfUInt32 timeScale = 0;  // 0: no movie header was found

@@ -23,6 +23,9 @@ constexpr ncfUInt32 kHighestUsefulId = 65535;
 // From 1904-01-01 to 1970-01-01.
 constexpr ncfSInt64 kSecondsTo1970 = 2082844800;
 
+// The id of what the library adds to a movie without a track header.
+constexpr int kNoId = -1;
+
 constexpr unsigned kTimecodeTag = MKTAG('t', 'm', 'c', 'd');
 
 // All bits set, in the width of either version of a header, means unknown.
@@ -30,6 +33,33 @@ template <class Number>
 bool IsKnownDuration(Number duration) {
     return duration > 0 && duration != Number{0xFFFFFFFF} &&
            duration != std::numeric_limits<Number>::max();
+}
+
+MovieFile::Raster RasterNow(const AVStream& stream) {
+    const AVCodecParameters& form = *stream.codecpar;
+    return {
+        form.width, form.height,
+        stream.sample_aspect_ratio.num > 0 ? stream.sample_aspect_ratio : form.sample_aspect_ratio};
+}
+
+// From the first packet's display to the end of the last; where some have no
+// times, as long as all of them last.
+double SecondsOf(const std::vector<PacketEntry>& packets, const AVStream& stream) {
+    ncfSInt64 first = std::numeric_limits<ncfSInt64>::max();
+    ncfSInt64 end = std::numeric_limits<ncfSInt64>::min();
+    double sum = 0.0;
+    bool tellsAll = true;
+    for (const PacketEntry& packet : packets) {
+        sum += static_cast<double>(packet.duration);
+        tellsAll = tellsAll && packet.displayTime != AV_NOPTS_VALUE;
+        if (packet.displayTime != AV_NOPTS_VALUE) {
+            first = std::min(first, packet.displayTime);
+            end = std::max(end, packet.displayTime + packet.duration);
+        }
+    }
+    const double span =
+        tellsAll && end > first ? static_cast<double>(end) - static_cast<double>(first) : sum;
+    return span > 0.0 ? span * av_q2d(stream.time_base) : 0.0;
 }
 
 }  // namespace
@@ -45,22 +75,48 @@ MovieFile::MovieFile(std::filesystem::path path, InputOwner input)
         atoms_ = ReadMovieAtoms(path_);
     }
     NumberTracks();
+    const bool isByContainer = !HasStreamDetails(*input_);
     for (unsigned i = 0; i < input_->nb_streams; ++i) {
-        told_.push_back(
-            {input_->streams[i]->codecpar->field_order, input_->streams[i]->avg_frame_rate});
+        const AVStream& stream = *input_->streams[i];
+        told_.push_back({isByContainer ? stream.codecpar->field_order : AV_FIELD_UNKNOWN,
+                         stream.avg_frame_rate, RasterNow(stream)});
     }
 }
 
+ncfUInt32 MovieFile::IdOf(unsigned stream) const {
+    const int id = input_->streams[stream]->id;
+    return IsMovieFamily(*input_) && id != kNoId ? static_cast<ncfUInt32>(id) : 0;
+}
+
+// The file's ids are the numbers while all differ and none is too high. Else
+// numbers go from 1 to n, where an id within that range still is the number of
+// its track, so looking for ids and for numbers never disagrees. What is no
+// track of the file, such as a picture attached to it, has the lowest number
+// that is left.
 void MovieFile::NumberTracks() {
-    std::set<int> ids;
-    bool useful = IsMovieFamily(*input_);
+    numbers_.assign(input_->nb_streams, 0);
+    std::set<ncfUInt32> ids;
+    bool areUseful = true;
     for (unsigned i = 0; i < input_->nb_streams; ++i) {
-        const int id = input_->streams[i]->id;
-        useful = useful && id > 0 && static_cast<ncfUInt32>(id) <= kHighestUsefulId &&
-                 ids.insert(id).second;
+        const ncfUInt32 id = IdOf(i);
+        areUseful = areUseful && id <= kHighestUsefulId && (id == 0 || ids.insert(id).second);
     }
+    const ncfUInt32 highest = areUseful ? kHighestUsefulId : input_->nb_streams;
+    std::set<ncfUInt32> taken;
     for (unsigned i = 0; i < input_->nb_streams; ++i) {
-        numbers_.push_back(useful ? static_cast<ncfUInt32>(input_->streams[i]->id) : i + 1);
+        const ncfUInt32 id = IdOf(i);
+        if (id != 0 && id <= highest && taken.insert(id).second) {
+            numbers_[i] = id;
+        }
+    }
+    ncfUInt32 next = 1;
+    for (ncfUInt32& number : numbers_) {
+        if (number == 0) {
+            while (taken.count(next) > 0) {
+                ++next;
+            }
+            number = next++;
+        }
     }
 }
 
@@ -69,8 +125,23 @@ bool MovieFile::IndexIsWhole() const {
 }
 
 int MovieFile::StreamOf(ncfUInt32 track) const {
-    const auto found = std::find(numbers_.begin(), numbers_.end(), track);
-    return track == 0 || found == numbers_.end() ? -1 : static_cast<int>(found - numbers_.begin());
+    for (std::size_t i = 0; track != 0 && i < numbers_.size(); ++i) {
+        if (numbers_[i] == track) {
+            return static_cast<int>(i);
+        }
+    }
+    for (std::size_t i = 0; track != 0 && i < numbers_.size(); ++i) {
+        if (IdOf(static_cast<unsigned>(i)) == track) {
+            return static_cast<int>(i);
+        }
+    }
+    return -1;
+}
+
+const MovieAtoms::Track* MovieFile::FindAtoms(ncfUInt32 track) const {
+    const int stream = StreamOf(track);
+    const ncfUInt32 id = stream < 0 ? 0 : IdOf(static_cast<unsigned>(stream));
+    return id == 0 ? nullptr : atoms_.Find(id);
 }
 
 const AVStream* MovieFile::FindTrack(ncfUInt32 track) const {
@@ -122,6 +193,12 @@ std::map<ncfUInt32, int> MovieFile::StreamsByTrack() const {
     for (std::size_t i = 0; i < numbers_.size(); ++i) {
         streams[numbers_[i]] = static_cast<int>(i);
     }
+    for (std::size_t i = 0; i < numbers_.size(); ++i) {
+        const ncfUInt32 id = IdOf(static_cast<unsigned>(i));
+        if (id != 0) {
+            streams.emplace(id, static_cast<int>(i));
+        }
+    }
     return streams;
 }
 
@@ -140,6 +217,17 @@ AVFieldOrder MovieFile::ContainerFieldOrder(ncfUInt32 track) const {
                : told_[static_cast<std::size_t>(stream)].fieldOrder;
 }
 
+MovieFile::Raster MovieFile::RasterOf(ncfUInt32 track) {
+    const int stream = StreamOf(track);
+    if (stream < 0) {
+        return {};
+    }
+    const Raster& told = told_[static_cast<std::size_t>(stream)].raster;
+    return IsMovieFamily(*input_) && told.width > 0 && told.height > 0
+               ? told
+               : RasterNow(*FindDetailedTrack(track));
+}
+
 // Samples by the time that the media takes, without regard to edits. 0.0 where
 // the container does not tell both.
 double MovieFile::MeanRateOfMedia(int stream) const {
@@ -156,13 +244,36 @@ double MovieFile::MeanRateOfMedia(int stream) const {
                : 0.0;
 }
 
+// Pictures by the time from the first to the end of the last. 0.0 for a track
+// that tells no times.
+double MovieFile::MeanRateOfPackets(int stream) {
+    std::string ignored;
+    const InputOwner input = OpenInput(path_, InputView::AsPresented, ignored);
+    if (!input || stream >= static_cast<int>(input->nb_streams)) {
+        return 0.0;
+    }
+    const std::vector<PacketEntry> packets = ListPackets(*input, stream, IndexIsWhole());
+    const double seconds = SecondsOf(packets, *input->streams[stream]);
+    return seconds > 0.0 ? static_cast<double>(packets.size()) / seconds : 0.0;
+}
+
+// The mean of what some containers name counts each field as a picture.
+bool MovieFile::MayHoldFieldsApart(int stream) const {
+    const AVCodecParameters& form = *input_->streams[stream]->codecpar;
+    return !IsMovieFamily(*input_) && TellsTimesOfAll(*input_) &&
+           form.codec_id == AV_CODEC_ID_H264 && form.field_order != AV_FIELD_PROGRESSIVE;
+}
+
 double MovieFile::PictureRate() {
     const ncfUInt32 track = FirstVideo();
     const int stream = StreamOf(track);
     if (stream < 0) {
         return 0.0;
     }
-    const double mean = MeanRateOfMedia(stream);
+    const double mean = IndexIsWhole() ? MeanRateOfMedia(stream)
+                        : atoms_.isFragmented || MayHoldFieldsApart(stream)
+                            ? MeanRateOfPackets(stream)
+                            : 0.0;
     if (mean > 0.0) {
         return mean;
     }
@@ -191,7 +302,6 @@ ncfUInt64 MovieFile::CountPictures(ncfUInt64 enough) {
     return std::min(counted_, enough);
 }
 
-// From the first packet's display to the end of the last, where no header tells.
 double MovieFile::SecondsOfPackets(int stream) {
     const auto known = secondsOfPackets_.find(stream);
     if (known != secondsOfPackets_.end()) {
@@ -201,28 +311,25 @@ double MovieFile::SecondsOfPackets(int stream) {
     std::string ignored;
     const InputOwner input = OpenInput(path_, InputView::AsPresented, ignored);
     if (input && stream < static_cast<int>(input->nb_streams)) {
-        ncfSInt64 first = std::numeric_limits<ncfSInt64>::max();
-        ncfSInt64 end = std::numeric_limits<ncfSInt64>::min();
-        for (const PacketEntry& packet : ListPackets(*input, stream, IndexIsWhole())) {
-            if (packet.displayTime != AV_NOPTS_VALUE) {
-                first = std::min(first, packet.displayTime);
-                end = std::max(end, packet.displayTime + packet.duration);
-            }
-        }
-        if (end > first) {
-            seconds = (static_cast<double>(end) - static_cast<double>(first)) *
-                      av_q2d(input->streams[stream]->time_base);
-        }
+        seconds = SecondsOf(ListPackets(*input, stream, IndexIsWhole()), *input->streams[stream]);
     }
     return secondsOfPackets_[stream] = seconds;
 }
 
+// Whether headers leave the length out or guess it: those of fragmented movies
+// speak of the part before the fragments, some streams are only measured by
+// their bytes, and program streams tell the times of some packets alone.
+bool MovieFile::NeedsPacketTimes() const {
+    return atoms_.isFragmented || !TellsTimesOfAll(*input_) ||
+           input_->duration_estimation_method == AVFMT_DURATION_FROM_BITRATE;
+}
+
 double MovieFile::Seconds(ncfUInt32 track) {
-    if (atoms_.isFragmented) {  // its headers speak of the part before the fragments
+    if (NeedsPacketTimes()) {
         double longest = 0.0;
         for (std::size_t i = 0; i < numbers_.size(); ++i) {
-            const bool wanted =
-                track == 0 ? IsVideo(numbers_[i]) || IsAudio(numbers_[i]) : numbers_[i] == track;
+            const bool wanted = track == 0 ? IsVideo(numbers_[i]) || IsAudio(numbers_[i])
+                                           : StreamOf(track) == static_cast<int>(i);
             longest = std::max(longest, wanted ? SecondsOfPackets(static_cast<int>(i)) : 0.0);
         }
         return longest;
@@ -235,7 +342,7 @@ double MovieFile::Seconds(ncfUInt32 track) {
     if (track == 0) {
         return movie;
     }
-    const MovieAtoms::Track* const atoms = atoms_.Find(track);
+    const MovieAtoms::Track* const atoms = FindAtoms(track);
     if (atoms && atoms_.timeScale > 0 && IsKnownDuration(atoms->duration)) {
         return static_cast<double>(atoms->duration) / atoms_.timeScale;
     }

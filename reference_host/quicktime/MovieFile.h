@@ -27,7 +27,11 @@ public:
     // Whether the container's index names every sample.
     bool IndexIsWhole() const;
 
-    // The stream of a track; null for a track that there is not.
+    // What the file's own atoms say of a track; null when they do not.
+    const MovieAtoms::Track* FindAtoms(ncfUInt32 track) const;
+
+    // The stream of a track, by its number or by the id that the file gives it;
+    // null for a track that there is not.
     const AVStream* FindTrack(ncfUInt32 track) const;
     int StreamOf(ncfUInt32 track) const;  // -1 for none
     ncfUInt32 HighestTrack() const;
@@ -39,12 +43,20 @@ public:
     bool IsTimecode(ncfUInt32 track) const;
     ncfUInt32 FirstVideo() const;  // 0 for none
     ncfUInt32 FirstAudio() const;
-    std::map<ncfUInt32, int> StreamsByTrack() const;
+    std::map<ncfUInt32, int> StreamsByTrack() const;  // ids included
 
     // What the headers left open is read from the media before this answers.
     const AVStream* FindDetailedTrack(ncfUInt32 track);
-    // Field order and rate as the container tells them, before that.
+    // Field order as the container tells it, before that.
     AVFieldOrder ContainerFieldOrder(ncfUInt32 track) const;
+    // Stored size of a track's pictures and their pixels' aspect, always the
+    // same: movies tell it, of other files the codec does. 0 for unknown.
+    struct Raster {
+        int width = 0;
+        int height = 0;
+        AVRational pixelAspect{0, 1};
+    };
+    Raster RasterOf(ncfUInt32 track);
     // Pictures a second of the first picture track, 0.0 when nothing tells.
     double PictureRate();
 
@@ -59,7 +71,11 @@ public:
 private:
     MovieFile(std::filesystem::path path, InputOwner input);
     void NumberTracks();
+    ncfUInt32 IdOf(unsigned stream) const;  // 0 for none
+    bool NeedsPacketTimes() const;
+    bool MayHoldFieldsApart(int stream) const;
     double MeanRateOfMedia(int stream) const;
+    double MeanRateOfPackets(int stream);
     double SecondsOfPackets(int stream);
     ncfUInt32 FirstWhere(bool (MovieFile::*test)(ncfUInt32) const) const;
 
@@ -70,6 +86,7 @@ private:
     struct Told {
         AVFieldOrder fieldOrder;
         AVRational rate;
+        Raster raster;
     };
     std::vector<Told> told_;  // of each stream, by the container
     bool hasDetails_ = false;

@@ -38,6 +38,18 @@ void FillDecodeTimes(std::vector<PacketEntry>& packets, ncfSInt64 mediaDuration)
     }
 }
 
+// Some of them tell whether the container keeps its samples whole.
+constexpr int kPacketsToCompare = 8;
+
+// Whether the second of two fields that came apart stands right behind the first.
+bool FieldsAreTogether(const std::vector<PacketEntry>& packets) {
+    return std::all_of(packets.begin(), packets.end(), [](const PacketEntry& packet) {
+        return !packet.second.isApart ||
+               packet.second.position + static_cast<ncfSInt64>(packet.second.size) ==
+                   packet.position + static_cast<ncfSInt64>(packet.size);
+    });
+}
+
 std::vector<std::size_t> RunEnds(const std::vector<PacketEntry>& packets) {
     std::vector<std::size_t> ends(packets.size(), packets.size());
     for (std::size_t i = packets.size(); i-- > 1;) {
@@ -54,20 +66,26 @@ std::vector<std::size_t> RunEnds(const std::vector<PacketEntry>& packets) {
 MovieSampleTable::Track MovieSampleTable::Load(int stream) const {
     Track track;
     std::string ignored;
-    const InputOwner input = OpenInput(path_, InputView::WholeMedia, ignored);
+    const InputOwner input = OpenInput(source_.path, InputView::WholeMedia, ignored);
     if (!input || stream >= static_cast<int>(input->nb_streams)) {
         return track;
     }
     if (IsMovieFamily(*input)) {  // its own times, untouched
         input->flags |= AVFMT_FLAG_NOFILLIN | AVFMT_FLAG_NOPARSE;
     }
-    track.packets = ListPackets(*input, stream, indexIsWhole_);
+    track.packets = ListPackets(*input, stream, source_.indexIsWhole);
+    track.isPlain =
+        source_.indexIsWhole || (FieldsAreTogether(track.packets) &&
+                                 AreStoredPlain(source_.path, stream, kPacketsToCompare));
     FillDecodeTimes(track.packets, input->streams[stream]->duration);
     track.samples = track.packets.size();
     track.runEnds = RunEnds(track.packets);
+    if (const auto found = source_.descriptionChanges.find(stream);
+        found != source_.descriptionChanges.end()) {
+        track.descriptionChanges = found->second;
+    }
     SoundForm form;
-    if (ReadSoundForm(*input->streams[stream], form) && form.bitsPerChannel > 0 &&
-        form.bytesPerPacket > 0) {
+    if (ReadSoundForm(*input->streams[stream], form) && form.isStoredPlain) {
         track.frameBytes = form.bytesPerPacket;
         track.frameDuration =
             std::max<ncfSInt64>(av_rescale_q(1, AVRational{1, static_cast<int>(form.sampleRate)},
@@ -91,13 +109,14 @@ MovieSampleTable::Track MovieSampleTable::Load(int stream) const {
 }
 
 const MovieSampleTable::Track* MovieSampleTable::Find(ncfUInt32 track) {
-    const auto stream = streams_.find(track);
-    if (stream == streams_.end()) {
+    const auto stream = source_.streams.find(track);
+    if (stream == source_.streams.end()) {
         return nullptr;
     }
-    const auto found = tracks_.find(track);
-    return found != tracks_.end() ? &found->second
-                                  : &tracks_.emplace(track, Load(stream->second)).first->second;
+    const auto found = tracks_.find(stream->second);
+    return found != tracks_.end()
+               ? &found->second
+               : &tracks_.emplace(stream->second, Load(stream->second)).first->second;
 }
 
 MovieSampleTable::Place MovieSampleTable::PlaceOf(const Track& track, ncfUInt64 sample) {
@@ -135,6 +154,25 @@ NCFRESULT MovieSampleTable::ForSample(ncfUInt32 track, ncfUInt64 sample, Out* ou
     });
 }
 
+// For questions about the sample's place in the file.
+template <class Out, class Value>
+NCFRESULT MovieSampleTable::ForPlainSample(ncfUInt32 track, ncfUInt64 sample, Out* out,
+                                           Value value) {
+    bool isPlain = true;
+    Out place = {};
+    const NCFRESULT result =
+        ForSample(track, sample, out ? &place : nullptr,
+                  [&](const Track& of, const PacketEntry& packet, const Place& at) {
+                      isPlain = of.isPlain && packet.position >= 0;
+                      return value(of, packet, at);
+                  });
+    if (result < 0 || !isPlain) {
+        return result < 0 ? result : NCF_E_NOTSUPPORTED;
+    }
+    *out = place;
+    return NCF_OK;
+}
+
 NCFRESULT MovieSampleTable::GetNumSamples(ncfUInt32 track, ncfUInt64* n) {
     if (!n) {
         return NCF_E_POINTER;
@@ -151,11 +189,11 @@ NCFRESULT MovieSampleTable::GetNumSamples(ncfUInt32 track, ncfUInt64* n) {
 }
 
 NCFRESULT MovieSampleTable::GetDataOffset(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* position) {
-    return ForSample(track, sample, position,
-                     [](const Track& of, const PacketEntry& packet, const Place& place) {
-                         return static_cast<ncfUInt64>(std::max<ncfSInt64>(packet.position, 0)) +
-                                place.within * of.frameBytes;
-                     });
+    return ForPlainSample(track, sample, position,
+                          [](const Track& of, const PacketEntry& packet, const Place& place) {
+                              return static_cast<ncfUInt64>(packet.position) +
+                                     place.within * of.frameBytes;
+                          });
 }
 
 NCFRESULT MovieSampleTable::GetSampleFlags(ncfUInt32 track, ncfUInt64 sample,
@@ -170,13 +208,16 @@ NCFRESULT MovieSampleTable::GetSampleFlags(ncfUInt32 track, ncfUInt64 sample,
 NCFRESULT MovieSampleTable::GetNextDiscontiguousDataAttributeChange(ncfUInt32 track,
                                                                     ncfUInt64 sample,
                                                                     ncfUInt64* next) {
-    return ForSample(track, sample, next, [](const Track& of, const PacketEntry&, Place place) {
-        const std::size_t packet = of.runEnds[place.packet];
-        if (packet == of.packets.size()) {
-            return of.samples + 1;
-        }
-        return (of.frameBytes == 0 ? ncfUInt64{packet} : of.firstSamples[packet]) + 1;
-    });
+    return ForPlainSample(
+        track, sample, next, [sample](const Track& of, const PacketEntry&, const Place& place) {
+            const std::size_t packet = of.runEnds[place.packet];
+            const ncfUInt64 end = packet == of.packets.size() ? of.samples
+                                  : of.frameBytes == 0        ? ncfUInt64{packet}
+                                                              : of.firstSamples[packet];
+            const auto change = std::lower_bound(of.descriptionChanges.begin(),
+                                                 of.descriptionChanges.end(), sample);
+            return (change == of.descriptionChanges.end() ? end : std::min(end, *change)) + 1;
+        });
 }
 
 NCFRESULT MovieSampleTable::GetDataSizePerSample(ncfUInt32 track, ncfUInt64 sample,

@@ -15,12 +15,18 @@ namespace host {
 
 // The wrapper's sample table: every stored sample, edit lists left aside. A
 // track is read when it is first asked for. Linear sound counts each frame of
-// all channels as a sample, though the container stores many together.
+// all channels as a sample, though the container stores many together. Places of
+// samples are refused where no bytes of the file are the sample.
 class MovieSampleTable final : public Component<QTWrapper::IQTWSampleTable> {
 public:
-    MovieSampleTable(std::filesystem::path path, std::map<ncfUInt32, int> streams,
-                     bool indexIsWhole)
-        : path_(std::move(path)), streams_(std::move(streams)), indexIsWhole_(indexIsWhole) {}
+    struct Source {
+        std::filesystem::path path;
+        std::map<ncfUInt32, int> streams;  // of each track
+        bool indexIsWhole = false;
+        // Of each stream: samples, from 0, with another description than before.
+        std::map<int, std::vector<ncfUInt64>> descriptionChanges;
+    };
+    explicit MovieSampleTable(Source source) : source_(std::move(source)) {}
 
     NCFRESULT GetNumSamples(ncfUInt32 track, ncfUInt64* n) override;
     NCFRESULT GetDataOffset(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* position) override;
@@ -43,6 +49,10 @@ private:
         ncfUInt32 frameBytes = 0;  // of linear sound, else 0
         ncfSInt64 frameDuration = 1;
         ncfSInt64 shift = 0;  // offsets relative to display order
+        // Whether each sample's bytes stand in the file as they are; program and
+        // transport streams cut them up.
+        bool isPlain = true;
+        std::vector<ncfUInt64> descriptionChanges;
     };
     struct Place {
         std::size_t packet;
@@ -53,14 +63,14 @@ private:
     Track Load(int stream) const;
     template <class Out, class Value>
     NCFRESULT ForSample(ncfUInt32 track, ncfUInt64 sample, Out* out, Value value);
+    template <class Out, class Value>
+    NCFRESULT ForPlainSample(ncfUInt32 track, ncfUInt64 sample, Out* out, Value value);
     static Place PlaceOf(const Track& track, ncfUInt64 sample);
     static ncfSInt64 OffsetOf(const Track& track, const PacketEntry& packet);
 
     std::mutex mutex_;
-    std::filesystem::path path_;
-    std::map<ncfUInt32, int> streams_;
-    bool indexIsWhole_;
-    std::map<ncfUInt32, Track> tracks_;
+    const Source source_;
+    std::map<int, Track> tracks_;  // by stream
 };
 
 }  // namespace host

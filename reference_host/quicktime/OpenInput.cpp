@@ -7,11 +7,68 @@ extern "C" {
 #include <libavutil/dict.h>
 }
 
-#include <cstring>
+#include <cstdio>
+#include <fstream>
 #include <string_view>
 
 namespace host {
 namespace {
+
+constexpr int kBufferBytes = 32768;
+
+char detailsMark;
+
+// The one file that an input reads. The library has a buffer of its own.
+int ReadBytes(void* file, std::uint8_t* to, int size) {
+    const auto got = static_cast<std::filebuf*>(file)->sgetn(reinterpret_cast<char*>(to), size);
+    return got > 0 ? static_cast<int>(got) : AVERROR_EOF;
+}
+
+int64_t SeekBytes(void* file, int64_t offset, int whence) {
+    auto& bytes = *static_cast<std::filebuf*>(file);
+    if ((whence & AVSEEK_SIZE) != 0) {
+        const auto here = bytes.pubseekoff(0, std::ios::cur, std::ios::in);
+        const auto end = bytes.pubseekoff(0, std::ios::end, std::ios::in);
+        bytes.pubseekpos(here, std::ios::in);
+        return end;
+    }
+    const auto from = whence & ~AVSEEK_FORCE;
+    return bytes.pubseekoff(offset,
+                            from == SEEK_SET   ? std::ios::beg
+                            : from == SEEK_CUR ? std::ios::cur
+                                               : std::ios::end,
+                            std::ios::in);
+}
+
+void CloseBytes(AVIOContext* bytes) {
+    if (bytes) {
+        delete static_cast<std::filebuf*>(bytes->opaque);
+        av_freep(&bytes->buffer);
+        avio_context_free(&bytes);
+    }
+}
+
+AVIOContext* OpenBytes(const std::filesystem::path& path) {
+    std::error_code error;
+    if (!std::filesystem::is_regular_file(path, error)) {
+        return nullptr;  // a pipe would be waited for
+    }
+    auto file = std::make_unique<std::filebuf>();
+    file->pubsetbuf(nullptr, 0);
+    auto* const buffer = static_cast<unsigned char*>(av_malloc(kBufferBytes));
+    if (!buffer || !file->open(path, std::ios::in | std::ios::binary)) {
+        av_free(buffer);
+        return nullptr;
+    }
+    AVIOContext* const bytes =
+        avio_alloc_context(buffer, kBufferBytes, 0, file.get(), ReadBytes, nullptr, SeekBytes);
+    if (!bytes) {
+        av_free(buffer);
+        return nullptr;
+    }
+    file.release();
+    return bytes;
+}
 
 std::string ErrorText(int error) {
     char text[AV_ERROR_MAX_STRING_SIZE] = {};
@@ -37,18 +94,31 @@ bool AreStreamsKnown(const AVFormatContext& input) {
 
 }  // namespace
 
+void CloseInput::operator()(AVFormatContext* context) const {
+    AVIOContext* const bytes = context->pb;  // the library closes none that it was given
+    avformat_close_input(&context);
+    CloseBytes(bytes);
+}
+
 InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::string& reason) {
-    AVFormatContext* opened = nullptr;
+    AVFormatContext* opened = avformat_alloc_context();
+    AVIOContext* const bytes = opened ? OpenBytes(path) : nullptr;
+    if (!bytes) {
+        avformat_free_context(opened);
+        reason = "the file can't be read";
+        return nullptr;
+    }
+    opened->pb = bytes;
     AVDictionary* options = nullptr;
-    // A file that names others, such as a playlist, reaches none of them.
-    av_dict_set(&options, "protocol_whitelist", "file", 0);
+    // The bytes are at hand, so no way of reaching a file is needed.
+    av_dict_set(&options, "protocol_whitelist", "none", 0);
     if (view == InputView::WholeMedia) {
         av_dict_set(&options, "ignore_editlist", "1", 0);
     }
-    const int error =
-        avformat_open_input(&opened, ("file:" + path.string()).c_str(), nullptr, &options);
+    const int error = avformat_open_input(&opened, path.c_str(), nullptr, &options);
     av_dict_free(&options);
     if (error < 0) {
+        CloseBytes(bytes);
         reason = ErrorText(error);
         return nullptr;
     }
@@ -67,18 +137,19 @@ bool IsMovieFamily(const AVFormatContext& input) {
     return std::string_view(input.iformat->name).find("mov") != std::string_view::npos;
 }
 
-bool IsStillPicture(const AVFormatContext& input) {
-    const std::string_view name = input.iformat->name;
-    const std::string_view pipe = "_pipe";
-    return name == "image2" ||
-           (name.size() > pipe.size() && name.substr(name.size() - pipe.size()) == pipe);
+bool TellsTimesOfAll(const AVFormatContext& input) {
+    return (input.iformat->flags & AVFMT_NOTIMESTAMPS) == 0 &&
+           std::string_view(input.iformat->name) != "mpeg";
+}
+
+bool HasStreamDetails(const AVFormatContext& input) {
+    return input.opaque == &detailsMark;
 }
 
 void FindStreamDetails(AVFormatContext& input) {
-    static char mark;
     // The library does not survive being asked twice.
-    if (input.opaque != &mark) {
-        input.opaque = &mark;
+    if (!HasStreamDetails(input)) {
+        input.opaque = &detailsMark;
         avformat_find_stream_info(&input, nullptr);
     }
 }

@@ -16,17 +16,20 @@ enum class InputView {
 };
 
 // Opens a file of any kind that the multimedia library knows. Null with a
-// sentence in `reason` that says what was wrong.
+// sentence in `reason` that says what was wrong. Nothing but this one file is
+// ever read: lists of other files, picture sequences and the like lead nowhere.
 InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::string& reason);
 
 // Whether the container is of the QuickTime and ISO family.
 bool IsMovieFamily(const AVFormatContext& input);
 
-// Whether the file is one still picture.
-bool IsStillPicture(const AVFormatContext& input);
+// Whether every packet carries its time. Where only some do, or none, a packet
+// reached by a seek can't be told from its neighbours.
+bool TellsTimesOfAll(const AVFormatContext& input);
 
 // Reads on for what the headers left open. May be repeated.
 void FindStreamDetails(AVFormatContext& input);
+bool HasStreamDetails(const AVFormatContext& input);
 
 // Lets the demuxer hand out one stream alone.
 void UseOneStream(AVFormatContext& input, int stream);

@@ -4,7 +4,12 @@
 #include "reference_host/quicktime/PacketList.h"
 
 #include <algorithm>
+#include <cstring>
+#include <fstream>
+#include <optional>
+#include <utility>
 
+#include "reference_host/quicktime/FieldParser.h"
 #include "reference_host/quicktime/OpenInput.h"
 
 namespace host {
@@ -57,16 +62,51 @@ PacketEntry EntryOf(const AVPacket& packet) {
     return entry;
 }
 
+void AddSecondField(PacketEntry& picture, const PacketEntry& field) {
+    picture.second = {field.decodeTime, field.displayTime, field.position, field.size, true};
+    picture.size += field.size;
+    picture.duration += field.duration;
+    picture.isDisposable = picture.isDisposable && field.isDisposable;
+}
+
+// Gives each picture of the stream until `each` has had enough.
 template <class Each>
 void ReadThrough(AVFormatContext& input, int stream, Each each) {
     UseOneStream(input, stream);
+    FieldParser parser(*input.streams[stream]);
     const PacketOwner packet(av_packet_alloc());
+    std::optional<PacketEntry> waiting;  // a first field, until the next packet is seen
+    FieldKind waitingKind = FieldKind::Whole;
     while (packet && av_read_frame(&input, packet.get()) >= 0) {
-        const bool more = packet->stream_index != stream || each(EntryOf(*packet));
+        if (packet->stream_index != stream) {
+            av_packet_unref(packet.get());
+            continue;
+        }
+        const FieldKind kind = parser.KindOf(*packet);
+        const PacketEntry entry = EntryOf(*packet);
         av_packet_unref(packet.get());
-        if (!more) {
+        if (waiting) {
+            const bool isPair = kind != FieldKind::Whole && kind != waitingKind;
+            if (isPair) {
+                AddSecondField(*waiting, entry);
+            }
+            const PacketEntry whole = *std::exchange(waiting, std::nullopt);
+            if (!each(whole)) {
+                return;
+            }
+            if (isPair) {
+                continue;
+            }
+        }
+        if (kind != FieldKind::Whole) {
+            waiting = entry;
+            waitingKind = kind;
+        } else if (!each(entry)) {
             return;
         }
+    }
+    if (waiting) {
+        each(*waiting);
     }
 }
 
@@ -91,6 +131,34 @@ std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool in
         return true;
     });
     return packets;
+}
+
+bool AreStoredPlain(const std::filesystem::path& path, int stream, int count) {
+    std::string ignored;
+    const InputOwner input = OpenInput(path, InputView::WholeMedia, ignored);
+    std::ifstream file(path, std::ios::binary);
+    const PacketOwner packet(av_packet_alloc());
+    if (!input || !file || !packet || stream >= static_cast<int>(input->nb_streams)) {
+        return false;
+    }
+    UseOneStream(*input, stream);
+    std::vector<char> bytes;
+    while (count > 0 && av_read_frame(input.get(), packet.get()) >= 0) {
+        bool isSame = true;
+        if (packet->stream_index == stream && packet->size > 0) {
+            bytes.resize(static_cast<std::size_t>(packet->size));
+            file.seekg(packet->pos < 0 ? 0 : packet->pos);
+            file.read(bytes.data(), packet->size);
+            isSame = file && packet->pos >= 0 &&
+                     std::memcmp(bytes.data(), packet->data, bytes.size()) == 0;
+            --count;
+        }
+        av_packet_unref(packet.get());
+        if (!isSame) {
+            return false;
+        }
+    }
+    return true;
 }
 
 ncfUInt64 CountShownPackets(AVFormatContext& input, int stream, bool indexIsWhole,

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <filesystem>
 #include <vector>
 
 #include "host_interfaces/framework/Types.h"
@@ -9,7 +10,8 @@
 
 namespace host {
 
-// One stored packet of a stream.
+// One stored picture of a stream, or another packet of it. Some containers keep
+// the two fields of a picture in a packet each; both are one entry.
 struct PacketEntry {
     ncfSInt64 decodeTime = AV_NOPTS_VALUE;
     ncfSInt64 displayTime = AV_NOPTS_VALUE;
@@ -19,6 +21,13 @@ struct PacketEntry {
     bool isSync = false;
     bool isDisposable = false;
     bool isShown = true;  // not only there for others to decode
+    struct SecondField {
+        ncfSInt64 decodeTime = AV_NOPTS_VALUE;
+        ncfSInt64 displayTime = AV_NOPTS_VALUE;
+        ncfSInt64 position = -1;
+        ncfUInt32 size = 0;
+        bool isApart = false;  // in a packet of its own
+    } second;
 };
 
 // The packets of a stream in decode order. Where the container has an index and
@@ -26,6 +35,10 @@ struct PacketEntry {
 // are read through once. `indexIsWhole`: the container's index names all of
 // them. Leaves the input at an unknown place.
 std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool indexIsWhole);
+
+// Whether the first packets of a stream, at most `count`, stand in the file at
+// their positions as they are.
+bool AreStoredPlain(const std::filesystem::path& path, int stream, int count);
 
 // The number of pictures, at most `enough`.
 ncfUInt64 CountShownPackets(AVFormatContext& input, int stream, bool indexIsWhole,

@@ -92,14 +92,13 @@ std::optional<std::size_t> PictureOrder::PictureOfPacket(std::size_t packet) con
     return pictureOf_[packet];
 }
 
-std::optional<std::size_t> PictureOrder::Find(ncfSInt64 decodeTime, ncfSInt64 displayTime,
-                                              ncfSInt64 position, std::size_t guess) const {
+std::optional<PictureOrder::Found> PictureOrder::Find(ncfSInt64 decodeTime, ncfSInt64 displayTime,
+                                                      ncfSInt64 position, std::size_t guess) const {
     const auto agree = [](ncfSInt64 a, ncfSInt64 b, ncfSInt64 unknown) {
         return a == unknown || b == unknown || a == b;
     };
-    const auto matches = [&](std::size_t i) {
-        const PacketEntry& packet = packets_[i];
-        if (position >= 0 && packet.position >= 0 && packet.position != position) {
+    const auto isOf = [&](const auto& packet) {
+        if (!agree(position, packet.position, -1)) {
             return false;
         }
         // Times of decoding are guessed by some demuxers, and guessed anew
@@ -109,12 +108,24 @@ std::optional<std::size_t> PictureOrder::Find(ncfSInt64 decodeTime, ncfSInt64 di
         }
         return agree(decodeTime, packet.decodeTime, AV_NOPTS_VALUE);
     };
-    for (std::size_t away = 0; away < packets_.size(); ++away) {
-        if (guess + away < packets_.size() && matches(guess + away)) {
-            return guess + away;
+    const auto at = [&](std::size_t i) -> std::optional<Found> {
+        if (isOf(packets_[i])) {
+            return Found{i, false};
         }
-        if (away > 0 && away <= guess && guess - away < packets_.size() && matches(guess - away)) {
-            return guess - away;
+        return packets_[i].second.isApart && isOf(packets_[i].second)
+                   ? std::optional<Found>(Found{i, true})
+                   : std::nullopt;
+    };
+    for (std::size_t away = 0; away < packets_.size(); ++away) {
+        if (guess + away < packets_.size()) {
+            if (const auto found = at(guess + away)) {
+                return found;
+            }
+        }
+        if (away > 0 && away <= guess && guess - away < packets_.size()) {
+            if (const auto found = at(guess - away)) {
+                return found;
+            }
         }
     }
     return std::nullopt;

@@ -34,8 +34,12 @@ public:
     bool HasDisplayTimes() const { return hasDisplayTimes_; }
 
     // The packet that a demuxer just gave, sought near `guess`.
-    std::optional<std::size_t> Find(ncfSInt64 decodeTime, ncfSInt64 displayTime, ncfSInt64 position,
-                                    std::size_t guess) const;
+    struct Found {
+        std::size_t packet;
+        bool isSecondField;
+    };
+    std::optional<Found> Find(ncfSInt64 decodeTime, ncfSInt64 displayTime, ncfSInt64 position,
+                              std::size_t guess) const;
 
 private:
     struct Picture {

@@ -4,7 +4,6 @@
 #include "reference_host/quicktime/PictureReader.h"
 
 #include <algorithm>
-#include <string_view>
 
 #include "reference_host/quicktime/OpenInput.h"
 
@@ -32,13 +31,6 @@ CodecOwner OpenDecoder(const AVStream& stream) {
     codec->flags |= AV_CODEC_FLAG_OUTPUT_CORRUPT;
     codec->thread_type = FF_THREAD_FRAME | FF_THREAD_SLICE;
     return avcodec_open2(codec.get(), decoder, nullptr) < 0 ? nullptr : std::move(codec);
-}
-
-// Whether every packet carries its time. Where only some do, or none, a packet
-// reached by a seek can't be told from its neighbours.
-bool TellsTimesOfAll(const AVFormatContext& input) {
-    return (input.iformat->flags & AVFMT_NOTIMESTAMPS) == 0 &&
-           std::string_view(input.iformat->name) != "mpeg";
 }
 
 bool IsDamaged(const AVFrame& frame) {
@@ -109,8 +101,9 @@ bool PictureReader::LandsBefore(std::size_t packet) {
     while (av_read_frame(input_.get(), packet_.get()) >= 0) {
         if (packet_->stream_index == stream_) {
             const auto found = order_.Find(packet_->dts, packet_->pts, packet_->pos, packet);
-            if (found && *found <= packet) {
-                nextPacket_ = *found;
+            // A second field alone makes no picture.
+            if (found && found->packet + found->isSecondField <= packet) {
+                nextPacket_ = found->packet;
                 isPending_ = true;
                 return true;
             }
@@ -154,7 +147,8 @@ bool PictureReader::Feed() {
     isPending_ = false;
     if (packet_->stream_index == stream_) {
         const std::size_t at = order_.Find(packet_->dts, packet_->pts, packet_->pos, nextPacket_)
-                                   .value_or(nextPacket_);
+                                   .value_or(PictureOrder::Found{nextPacket_, false})
+                                   .packet;
         nextPacket_ = at + 1;
         if (at >= runStart_) {
             codec_->reordered_opaque = static_cast<ncfSInt64>(at);

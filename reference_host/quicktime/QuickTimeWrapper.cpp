@@ -3,6 +3,8 @@
 
 #include "reference_host/quicktime/QuickTimeWrapper.h"
 
+#include <algorithm>
+
 #include "reference_host/framework/Guard.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/quicktime/AudioReader.h"
@@ -41,9 +43,16 @@ NCFRESULT QuickTimeWrapper::GetSampleTable(QTWrapper::IQTWSampleTable** table) {
         return NMA_E_NOTINITIALIZED;
     }
     return Guarded([&] {
-        *table = MakeRef<MovieSampleTable>(movie_->Path(), movie_->StreamsByTrack(),
-                                           movie_->IndexIsWhole())
-                     .Detach();
+        MovieSampleTable::Source source;
+        source.path = movie_->Path();
+        source.streams = movie_->StreamsByTrack();
+        source.indexIsWhole = movie_->IndexIsWhole();
+        for (const auto& [track, stream] : source.streams) {
+            if (const MovieAtoms::Track* const atoms = movie_->FindAtoms(track)) {
+                source.descriptionChanges[stream] = atoms->descriptionChanges;
+            }
+        }
+        *table = MakeRef<MovieSampleTable>(std::move(source)).Detach();
         return NCF_OK;
     });
 }
@@ -88,9 +97,9 @@ NCFRESULT QuickTimeWrapper::GetQTVideoReader(QTWrapper::IQTVideoReader** reader)
         source.path = movie_->Path();
         source.stream = movie_->StreamOf(track);
         source.indexIsWhole = movie_->IndexIsWhole();
-        const AVCodecParameters& form = *movie_->FindTrack(track)->codecpar;
-        source.width = static_cast<ncfUInt32>(form.width > 0 ? form.width : 0);
-        source.height = static_cast<ncfUInt32>(form.height > 0 ? form.height : 0);
+        const MovieFile::Raster raster = movie_->RasterOf(track);
+        source.width = static_cast<ncfUInt32>(std::max(raster.width, 0));
+        source.height = static_cast<ncfUInt32>(std::max(raster.height, 0));
         *reader = MakeRef<VideoReader>(std::move(source)).Detach();
         return NCF_OK;
     });

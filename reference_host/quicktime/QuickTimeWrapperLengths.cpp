@@ -155,7 +155,12 @@ ncfUInt64 QuickTimeWrapper::GetTrackDuration(ncfUInt32 track) {
     if (!movie_ || !movie_->FindTrack(track)) {
         return 0;
     }
-    return Units(movie_->Seconds(track), GetMovieTimeScale(), 0.5);
+    ncfUInt64 duration = 0;
+    Guarded([&] {
+        duration = Units(movie_->Seconds(track), GetMovieTimeScale(), 0.5);
+        return NCF_OK;
+    });
+    return duration;
 }
 
 }  // namespace host

@@ -95,7 +95,12 @@ NCFRESULT QuickTimeWrapper::GetCodecColorSpaceInfo(ncfBool* found709, ncfBool* f
 }
 
 ncfBool QuickTimeWrapper::MovieHasOneFrame() {
-    return movie_ && movie_->CountPictures(2) == 1;
+    ncfBool hasOne = 0;
+    Guarded([&] {
+        hasOne = movie_ && movie_->CountPictures(2) == 1;
+        return NCF_OK;
+    });
+    return hasOne;
 }
 
 NCFRESULT QuickTimeWrapper::MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) {
@@ -141,15 +146,13 @@ NCFRESULT QuickTimeWrapper::GetMovieBox(ncfUInt32* width, ncfUInt32* height, ncf
     if (!width || !height) {
         return NCF_E_POINTER;
     }
-    const AVStream* const stream = movie_->FindTrack(movie_->FirstVideo());
-    if (!stream || stream->codecpar->width <= 0 || stream->codecpar->height <= 0) {
+    const MovieFile::Raster raster = movie_->RasterOf(movie_->FirstVideo());
+    if (raster.width <= 0 || raster.height <= 0) {
         return NCF_E_NOTFOUND;
     }
-    *width = static_cast<ncfUInt32>(stream->codecpar->width);
-    *height = static_cast<ncfUInt32>(stream->codecpar->height);
-    const AVRational told = stream->sample_aspect_ratio.num > 0
-                                ? stream->sample_aspect_ratio
-                                : stream->codecpar->sample_aspect_ratio;
+    *width = static_cast<ncfUInt32>(raster.width);
+    *height = static_cast<ncfUInt32>(raster.height);
+    const AVRational told = raster.pixelAspect;
     std::optional<header_parser::Ratio> pixel;
     if (told.num > 0 && told.den > 0) {
         pixel = header_parser::Ratio{static_cast<ncfUInt32>(told.num),

@@ -5,7 +5,7 @@ extern "C" {
 #include <libavutil/dict.h>
 }
 
-#include <cstring>
+#include <cstdio>
 
 #include "reference_host/framework/Guard.h"
 #include "reference_host/quicktime/CodecNames.h"
@@ -24,32 +24,21 @@ void Give(Out* out, Value value) {
     }
 }
 
-bool IsPrintable(ncfUInt32 tag) {
-    for (int shift = 0; shift < 32; shift += 8) {
-        const ncfUInt32 c = tag >> shift & 0xFF;
-        if (c < 0x20 || c > 0x7E) {
-            return false;
+// A code as the library prints it: characters, and "[n]" for those that are
+// none. The first is in the top byte; 0 for a text that is no such code.
+ncfUInt32 CodeFromText(const char* text) {
+    ncfUInt32 code = 0;
+    int count = 0;
+    for (; *text != 0 && count < 4; ++count) {
+        unsigned value = static_cast<unsigned char>(*text);
+        int length = 1;
+        if (*text == '[' && (std::sscanf(text, "[%3u]%n", &value, &length) != 1 || value > 0xFF)) {
+            return 0;
         }
+        code = code << 8 | value;
+        text += length;
     }
-    return true;
-}
-
-// The tag with its first character in the low byte; 0 for none. A codec of
-// another container has the tag that it has in movies.
-ncfUInt32 TagOf(const AVCodecParameters& form) {
-    if (IsPrintable(form.codec_tag)) {
-        return form.codec_tag;
-    }
-    const AVCodecTag* const table = form.codec_type == AVMEDIA_TYPE_AUDIO
-                                        ? avformat_get_mov_audio_tags()
-                                        : avformat_get_mov_video_tags();
-    const AVCodecTag* const tables[] = {table, nullptr};
-    const ncfUInt32 tag = av_codec_get_tag(tables, form.codec_id);
-    return IsPrintable(tag) ? tag : 0;
-}
-
-ncfUInt32 Swapped(ncfUInt32 tag) {
-    return tag << 24 | (tag & 0xFF00u) << 8 | (tag >> 8 & 0xFF00u) | tag >> 24;
+    return *text == 0 && count == 4 ? code : 0;
 }
 
 }  // namespace
@@ -65,12 +54,12 @@ NCFRESULT QuickTimeWrapper::GetFourCCFromImageDescrptor(ncfUInt32 track, ncfUInt
     if (!stream) {
         return NCF_E_NOTFOUND;
     }
-    const ncfUInt32 tag = TagOf(*stream->codecpar);
-    if (tag == 0) {
+    const ncfUInt32 code = CodecCode(*stream->codecpar);
+    if (code == 0) {
         return NCF_E_FAIL;
     }
     for (int i = 0; i < 4; ++i) {
-        fourBytes[i] = static_cast<ncfUInt8>(tag >> (8 * i));
+        fourBytes[i] = static_cast<ncfUInt8>(code >> (24 - 8 * i));
     }
     return NCF_OK;
 }
@@ -80,7 +69,7 @@ ncfUInt32 QuickTimeWrapper::GetImageDescriptionCount(ncfUInt32 track) {
     if (!stream) {
         return 0;
     }
-    const MovieAtoms::Track* const atoms = movie_->Atoms().Find(track);
+    const MovieAtoms::Track* const atoms = movie_->FindAtoms(track);
     return atoms && atoms->descriptionCount > 0 ? atoms->descriptionCount : 1;
 }
 
@@ -101,13 +90,7 @@ NCFRESULT QuickTimeWrapper::GetCodecTypeName(ncfUInt32 track, INCFString* name) 
         if (!stream) {
             return NCF_E_NOTFOUND;
         }
-        std::string text;
-        CodecName(Swapped(TagOf(*stream->codecpar)), text);
-        if (text.empty()) {
-            const AVCodecDescriptor* const codec =
-                avcodec_descriptor_get(stream->codecpar->codec_id);
-            text = codec ? (codec->long_name ? codec->long_name : codec->name) : "";
-        }
+        const std::string text = CodecNameOf(*stream->codecpar);
         return name->AssignUTF8(kNCFUTF8, text.c_str(), static_cast<ncfUInt32>(text.size()));
     });
 }
@@ -124,12 +107,7 @@ NCFRESULT QuickTimeWrapper::GetVendor(ncfUInt32 track, ncfUInt32* vendor) {
         return NCF_E_NOTFOUND;
     }
     const AVDictionaryEntry* const entry = av_dict_get(stream->metadata, "vendor_id", nullptr, 0);
-    *vendor = 0;
-    if (entry && std::strlen(entry->value) == 4) {
-        for (int i = 0; i < 4; ++i) {
-            *vendor = *vendor << 8 | static_cast<unsigned char>(entry->value[i]);
-        }
-    }
+    *vendor = entry ? CodeFromText(entry->value) : 0;
     return NCF_OK;
 }
 

@@ -6,6 +6,7 @@
 #include <algorithm>
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/SoundForm.h"
 #include "reference_host/quicktime/SoundWords.h"
 
 namespace host {
@@ -36,8 +37,8 @@ std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& pa
         return nullptr;
     }
     codec->pkt_timebase = of.time_base;
-    if (avcodec_open2(codec.get(), decoder, nullptr) < 0 || of.codecpar->sample_rate <= 0 ||
-        of.codecpar->ch_layout.nb_channels <= 0) {
+    SoundForm form;
+    if (!ReadSoundForm(of, form) || avcodec_open2(codec.get(), decoder, nullptr) < 0) {
         return nullptr;
     }
     UseOneStream(*input, stream);

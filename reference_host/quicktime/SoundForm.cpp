@@ -24,9 +24,11 @@ constexpr ncfUInt32 kFloat = 1;
 constexpr ncfUInt32 kBigEndian = 2;
 constexpr ncfUInt32 kSigned = 4;
 constexpr ncfUInt32 kPacked = 8;
+constexpr ncfUInt32 kPlanar = 32;
 
 constexpr double kHighestRate = 1e9;
-constexpr int kMostChannels = 0xFFFF;
+// No instrument has more; memory for a moment of sound grows with them.
+constexpr int kMostChannels = 1024;
 
 // Codes of compressed sound. Sound that is not listed goes by its own tag.
 struct CompressedRow {
@@ -42,23 +44,42 @@ constexpr CompressedRow kCompressed[] = {
     {AV_CODEC_ID_OPUS, Code("opus")},      {AV_CODEC_ID_FLAC, Code("flac")},
 };
 
-// Linear sound is told by the name of its kind: sign, bits and byte order.
-bool ReadLinearKind(AVCodecID codec, SoundForm& form) {
+// Discs hold linear sound behind a header in each packet, which tells its depth.
+bool ReadLinearKindOfDiscs(const AVCodecParameters& parameters, SoundForm& form) {
+    if (parameters.codec_id != AV_CODEC_ID_PCM_BLURAY &&
+        parameters.codec_id != AV_CODEC_ID_PCM_DVD) {
+        return false;
+    }
+    form.bitsPerChannel = static_cast<ncfUInt32>(
+        parameters.bits_per_coded_sample > 0 ? parameters.bits_per_coded_sample : 16);
+    form.isBigEndian = true;
+    form.formatFlags = kPacked | kSigned | kBigEndian;
+    return true;
+}
+
+// Other linear sound is told by the name of its kind: sign, bits and byte order.
+bool ReadLinearKind(const AVCodecParameters& parameters, SoundForm& form) {
+    const AVCodecID codec = parameters.codec_id;
     const std::string_view name = avcodec_get_name(codec);
     if (name.substr(0, 4) != "pcm_" || name.size() < 6) {
         return false;
+    }
+    if (ReadLinearKindOfDiscs(parameters, form)) {
+        return true;
     }
     const char kind = name[4];
     if ((kind != 's' && kind != 'u' && kind != 'f') || name[5] < '0' || name[5] > '9') {
         return false;  // a-law and the like are compressed
     }
+    const bool isPlanar = name.find("planar") != std::string_view::npos;
     form.bitsPerChannel = static_cast<ncfUInt32>(av_get_bits_per_sample(codec));
     form.isBigEndian = name.find("be") != std::string_view::npos;
+    form.isStoredPlain = !isPlanar && codec != AV_CODEC_ID_PCM_S24DAUD;
     form.formatFlags = kPacked |
                        (kind == 'f'   ? kFloat
                         : kind == 's' ? kSigned
                                       : 0u) |
-                       (form.isBigEndian ? kBigEndian : 0u);
+                       (form.isBigEndian ? kBigEndian : 0u) | (isPlanar ? kPlanar : 0u);
     return form.bitsPerChannel > 0;
 }
 
@@ -103,7 +124,7 @@ bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
     SoundForm form;
     form.channels = static_cast<ncfUInt32>(channels);
     form.sampleRate = parameters.sample_rate;
-    if (ReadLinearKind(parameters.codec_id, form)) {
+    if (ReadLinearKind(parameters, form)) {
         form.formatId = Code("lpcm");
         form.bytesPerPacket = form.channels * ((form.bitsPerChannel + 7) / 8);
         form.framesPerPacket = 1;

@@ -12,12 +12,13 @@ struct SoundForm {
     ncfUInt32 channels = 0;
     double sampleRate = 0.0;        // frames per second
     ncfUInt32 formatId = 0;         // 'lpcm' for every linear kind
-    ncfUInt32 formatFlags = 0;      // 1 float, 2 big endian, 4 signed, 8 packed
+    ncfUInt32 formatFlags = 0;      // 1 float, 2 big endian, 4 signed, 8 packed, 32 planar
     ncfUInt32 bytesPerPacket = 0;   // linear: a frame of all channels; 0: it varies
     ncfUInt32 framesPerPacket = 0;  // 0: it varies
     ncfUInt32 bitsPerChannel = 0;   // 0 for compressed sound
     bool isBigEndian = false;
     bool isConstantBitRate = false;
+    bool isStoredPlain = false;  // linear, and the file holds frame after frame
 };
 
 // false when the stream is no sound, or its numbers make no sense.

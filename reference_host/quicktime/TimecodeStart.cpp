@@ -48,6 +48,11 @@ bool ReadTimecodeStart(const AVStream& stream, TimecodeStart& out) {
                 ? (start.timeScale + start.frameDuration - 1) / start.frameDuration
                 : 0;
     }
+    // Nothing can be counted with a zero, of which one byte is looked at.
+    if (start.timeScale == 0 || start.frameDuration == 0 || (start.framesPerSecond & 0xFF) == 0 ||
+        frames > 0xFF) {
+        return false;
+    }
     out = start;
     return true;
 }

@@ -59,10 +59,24 @@ TEST(PictureOrder, FillsTimesThatTheContainerLeavesOut) {
 TEST(PictureOrder, FindsAPacketByItsTimesAndPlace) {
     const host::PictureOrder order(
         {Packet(0, 1, true), Packet(1, 4, false), Packet(2, 2, false), Packet(3, 3, false)});
-    EXPECT_EQ(order.Find(2, 2, 200, 0), 2u);
-    EXPECT_EQ(order.Find(9, 4, 100, 3), 1u);  // times of decoding may be guesses
-    EXPECT_EQ(order.Find(AV_NOPTS_VALUE, AV_NOPTS_VALUE, 300, 0), 3u);
+    EXPECT_EQ(order.Find(2, 2, 200, 0).value().packet, 2u);
+    EXPECT_EQ(order.Find(9, 4, 100, 3).value().packet, 1u);  // times of decoding may be guesses
+    EXPECT_EQ(order.Find(AV_NOPTS_VALUE, AV_NOPTS_VALUE, 300, 0).value().packet, 3u);
     EXPECT_FALSE(order.Find(2, 2, 777, 0));
+}
+
+TEST(PictureOrder, KnowsTheSecondFieldOfAPicture) {
+    std::vector<host::PacketEntry> packets = {Packet(0, 0, true), Packet(2, 2, false)};
+    packets[0].second = {1, 1, 100, 50, true};
+    packets[1].second = {3, 3, 300, 50, true};
+    const host::PictureOrder order(packets);
+    const auto first = order.Find(2, 2, 200, 1);
+    const auto second = order.Find(3, 3, 300, 2);
+    ASSERT_TRUE(first && second);
+    EXPECT_EQ(first->packet, 1u);
+    EXPECT_FALSE(first->isSecondField);
+    EXPECT_EQ(second->packet, 1u);
+    EXPECT_TRUE(second->isSecondField);
 }
 
 }  // namespace

@@ -47,6 +47,31 @@ TEST(SoundForm, TellsEveryKindOfLinearSound) {
     }
 }
 
+TEST(SoundForm, KnowsLinearSoundThatIsNotStoredFrameAfterFrame) {
+    host::SoundForm form;
+    ASSERT_TRUE(host::ReadSoundForm(Sound(AV_CODEC_ID_PCM_S16LE, 2, 48000).stream, form));
+    EXPECT_TRUE(form.isStoredPlain);
+    for (const AVCodecID codec : {AV_CODEC_ID_PCM_BLURAY, AV_CODEC_ID_PCM_DVD}) {
+        Sound disc(codec, 2, 48000);
+        disc.parameters->bits_per_coded_sample = 24;
+        ASSERT_TRUE(host::ReadSoundForm(disc.stream, form));
+        EXPECT_EQ(form.formatId, 0x6C70636Du);
+        EXPECT_EQ(form.bitsPerChannel, 24u);
+        EXPECT_EQ(form.bytesPerPacket, 6u);
+        EXPECT_EQ(form.formatFlags, 14u);
+        EXPECT_TRUE(form.isBigEndian);
+        EXPECT_TRUE(form.isConstantBitRate);
+        EXPECT_FALSE(form.isStoredPlain);
+        disc.parameters->bits_per_coded_sample = 0;
+        ASSERT_TRUE(host::ReadSoundForm(disc.stream, form));
+        EXPECT_EQ(form.bitsPerChannel, 16u);
+    }
+    ASSERT_TRUE(host::ReadSoundForm(Sound(AV_CODEC_ID_PCM_S16LE_PLANAR, 2, 48000).stream, form));
+    EXPECT_EQ(form.formatId, 0x6C70636Du);
+    EXPECT_EQ(form.formatFlags, 44u);
+    EXPECT_FALSE(form.isStoredPlain);
+}
+
 TEST(SoundForm, TellsCompressedSoundByItsCode) {
     Sound aac(AV_CODEC_ID_AAC, 2, 44100);
     aac.parameters->frame_size = 1024;
@@ -67,7 +92,8 @@ TEST(SoundForm, RefusesNumbersThatMakeNoSense) {
     host::SoundForm form;
     EXPECT_FALSE(host::ReadSoundForm(Sound(AV_CODEC_ID_AAC, 0, 48000).stream, form));
     EXPECT_FALSE(host::ReadSoundForm(Sound(AV_CODEC_ID_AAC, 2, 0).stream, form));
-    EXPECT_FALSE(host::ReadSoundForm(Sound(AV_CODEC_ID_AAC, 70000, 48000).stream, form));
+    EXPECT_FALSE(host::ReadSoundForm(Sound(AV_CODEC_ID_AAC, 1025, 48000).stream, form));
+    EXPECT_TRUE(host::ReadSoundForm(Sound(AV_CODEC_ID_AAC, 1024, 48000).stream, form));
     Sound video(AV_CODEC_ID_AAC, 2, 48000);
     video.parameters->codec_type = AVMEDIA_TYPE_VIDEO;
     EXPECT_FALSE(host::ReadSoundForm(video.stream, form));

@@ -1,0 +1,69 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <gtest/gtest.h>
+
+#include <chrono>
+
+#include "reference_host/quicktime/MovieAtoms.h"
+#include "tests/support/movies/Movie.h"
+#include "tests/unit/quicktime/MadeMovie.h"
+
+using namespace quicktime_tests;
+
+namespace {
+
+host::MovieAtoms Read(const movies::Movie& movie) {
+    return host::ReadMovieAtoms(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path());
+}
+
+movies::Movie TwoDescriptions() {
+    movies::Movie movie;
+    movies::Track track = movies::VideoTrack(movies::VideoFormat(), 0, 25, 1, 10);
+    track.descriptions.push_back(movies::VideoFormat().ToBox());
+    track.samples = {{5, 10, 1}, {7, 10, 1}, {4, 10, 1}};
+    track.samples[1].description = 2;
+    track.samplesPerChunk = 3;
+    movie.tracks.push_back(track);
+    return movie;
+}
+
+TEST(MovieAtoms, TellWhereTheDescriptionChanges) {
+    const host::MovieAtoms atoms = Read(TwoDescriptions());
+    ASSERT_EQ(atoms.tracks.size(), 1u);
+    EXPECT_EQ(atoms.tracks[0].descriptionCount, 2u);
+    EXPECT_EQ(atoms.tracks[0].descriptionChanges, (std::vector<ncfUInt64>{5, 12}));
+}
+
+TEST(MovieAtoms, TellNoChangeWithinOneDescription) {
+    movies::Movie movie;
+    movie.tracks.push_back(movies::VideoTrack(movies::VideoFormat(), 20, 25, 1, 10));
+    EXPECT_TRUE(Read(movie).tracks.at(0).descriptionChanges.empty());
+}
+
+// A table of chunks that goes back, or names more of them than it has, ends there.
+TEST(MovieAtoms, StopAtATableThatLies) {
+    movies::Movie movie = TwoDescriptions();
+    movies::Box chunks("stsc");
+    chunks.Version(0).U32(900000000).U32(1).U32(2).U32(1).U32(4).U32(2).U32(2).U32(2).U32(2).U32(1);
+    movie.tracks[0].replaced.push_back(chunks);
+    const auto start = std::chrono::steady_clock::now();
+    EXPECT_EQ(Read(movie).tracks.at(0).descriptionChanges, (std::vector<ncfUInt64>{6}));
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(5));
+}
+
+TEST(MovieAtoms, EndRunsOfSamplesInTheTable) {
+    const MadeMovie movie(movies::Build(TwoDescriptions()).ToBytes(), ".mov");
+    const auto wrapper = OpenWrapper(movie.Path());
+    ASSERT_TRUE(wrapper);
+    EXPECT_EQ(wrapper->GetImageDescriptionCount(1), 2u);
+    host::Ref<QTWrapper::IQTWSampleTable> table;
+    ASSERT_EQ(wrapper->GetSampleTable(table.Out()), NCF_OK);
+    for (const auto& [sample, expected] :
+         {std::pair<ncfUInt64, ncfUInt64>{1, 6}, {5, 6}, {6, 13}, {12, 13}, {13, 17}, {16, 17}}) {
+        ncfUInt64 next = 0;
+        ASSERT_EQ(table->GetNextDiscontiguousDataAttributeChange(1, sample, &next), NCF_OK);
+        EXPECT_EQ(next, expected) << sample;
+    }
+}
+
+}  // namespace

@@ -1,0 +1,95 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <gtest/gtest.h>
+#include <sys/stat.h>
+
+#include <chrono>
+#include <fstream>
+
+#include "reference_host/quicktime/OpenInput.h"
+#include "tests/unit/quicktime/MadeMovie.h"
+
+using namespace quicktime_tests;
+
+namespace {
+
+class OpenInput : public testing::Test {
+protected:
+    OpenInput() {
+        std::string pattern = std::filesystem::temp_directory_path() / "open-input-XXXXXX";
+        folder_ = mkdtemp(pattern.data());
+    }
+    ~OpenInput() override { std::filesystem::remove_all(folder_); }
+
+    std::filesystem::path Write(const std::string& name, const std::string& text) {
+        std::ofstream(folder_ / name, std::ios::binary) << text;
+        return folder_ / name;
+    }
+    std::filesystem::path Make(const std::string& name, const std::string& arguments,
+                               const std::string& ending) {
+        const MadeMovie movie(arguments, ending);
+        std::filesystem::copy_file(movie.Path(), folder_ / name);
+        return folder_ / name;
+    }
+    static host::InputOwner Open(const std::filesystem::path& path, std::string& reason) {
+        return host::OpenInput(path, host::InputView::AsPresented, reason);
+    }
+
+    std::filesystem::path folder_;
+};
+
+// Lists open none of the files they name, not even those beside them.
+TEST_F(OpenInput, ReachesNoOtherFile) {
+    NEEDS_FFMPEG();
+    Make("beside.wav", "-f lavfi -i sine=d=0.2", ".wav");
+    Make("beside.ts", "-f lavfi -i testsrc2=s=64x48:r=25:d=0.2", ".ts");
+    std::string reason;
+    EXPECT_FALSE(Open(Write("list.txt", "ffconcat version 1.0\nfile beside.wav\n"), reason));
+    EXPECT_FALSE(reason.empty());
+    EXPECT_FALSE(Open(Write("list.m3u8",
+                            "#EXTM3U\n#EXT-X-TARGETDURATION:1\n#EXTINF:0.2,\nbeside.ts\n"
+                            "#EXT-X-ENDLIST\n"),
+                      reason));
+}
+
+// A name that looks like a pattern for many pictures is the name of one file.
+TEST_F(OpenInput, TakesNamesAsTheyAre) {
+    NEEDS_FFMPEG();
+    for (const char* const name : {"shot%03d.png", "shot*.png", "a:b ?#.png", "http:x.png"}) {
+        const auto file = Make(name, "-f lavfi -i testsrc2=s=64x48 -frames:v 1", ".png");
+        Make("shot001.png", "-f lavfi -i testsrc2=s=32x32 -frames:v 1", ".png");
+        std::string reason;
+        const auto input = Open(file, reason);
+        ASSERT_TRUE(input) << name << ": " << reason;
+        EXPECT_EQ(input->streams[0]->codecpar->width, 64) << name;
+        std::filesystem::remove(folder_ / "shot001.png");
+    }
+}
+
+TEST_F(OpenInput, RefusesWhatIsNoFile) {
+    std::string reason;
+    EXPECT_FALSE(Open(folder_, reason));
+    EXPECT_EQ(reason, "the file can't be read");
+    EXPECT_FALSE(Open(folder_ / "absent.mov", reason));
+    ASSERT_EQ(mkfifo((folder_ / "pipe.mov").c_str(), 0600), 0);
+    const auto start = std::chrono::steady_clock::now();
+    EXPECT_FALSE(Open(folder_ / "pipe.mov", reason));
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(1));
+}
+
+TEST_F(OpenInput, LeavesNothingOpen) {
+    NEEDS_FFMPEG();
+    const auto opened = [] {
+        return std::distance(std::filesystem::directory_iterator("/proc/self/fd"), {});
+    };
+    const auto before = opened();
+    std::string reason;
+    EXPECT_FALSE(Open(Write("words.mov", "no movie at all"), reason));
+    const auto file = Make("a.wav", "-f lavfi -i sine=d=0.2", ".wav");
+    EXPECT_TRUE(Open(file, reason));
+    EXPECT_EQ(opened(), before);
+    const auto input = Open(file, reason);
+    EXPECT_EQ(opened(), before + 1);
+}
+
+}  // namespace

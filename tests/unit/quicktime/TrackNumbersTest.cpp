@@ -1,0 +1,226 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// Numbers and ids of tracks, and what movies tell of each.
+
+#include <gtest/gtest.h>
+
+#include "reference_host/framework/String.h"
+#include "tests/support/movies/Movie.h"
+#include "tests/unit/quicktime/MadeMovie.h"
+
+using namespace quicktime_tests;
+
+namespace {
+
+using Wrapper = host::Ref<QTWrapper::IQuickTimeWrapper>;
+
+// Picture, sound of one channel and sound of two, under these ids.
+MadeMovie MovieWithIds(const std::vector<std::uint32_t>& ids) {
+    movies::Movie movie;
+    movie.timeScale = 48000;
+    movies::SoundFormat one;
+    one.channels = 1;
+    movie.tracks = {movies::VideoTrack(movies::VideoFormat(), 10, 25, 1, 100),
+                    movies::SoundTrack(one, 1000), movies::SoundTrack(movies::SoundFormat(), 2000)};
+    for (std::size_t i = 0; i < ids.size(); ++i) {
+        movie.tracks[i].id = ids[i];
+    }
+    return MadeMovie(movies::Build(movie).ToBytes(), ".mov");
+}
+
+Wrapper OpenWithIds(const std::vector<std::uint32_t>& ids) {
+    return OpenWrapper(MovieWithIds(ids).Path());
+}
+
+// Channels of a sound track, 0 when there is none of that number or id.
+ncfUInt32 Channels(const Wrapper& wrapper, ncfUInt32 track) {
+    ncfUInt32 channels = 0;
+    return wrapper->GetAudioInfoForTrack(track, &channels, nullptr, nullptr, nullptr, nullptr,
+                                         nullptr, nullptr, nullptr, nullptr) == NCF_OK
+               ? channels
+               : 0;
+}
+
+std::string Kinds(const Wrapper& wrapper) {
+    std::string kinds;
+    for (ncfUInt32 i = 0; i <= wrapper->GetNumberOfTracks(); ++i) {
+        kinds += wrapper->IsVideoTrack(i)      ? 'v'
+                 : wrapper->IsAudioTrack(i)    ? 'a'
+                 : wrapper->IsTimeCodeTrack(i) ? 't'
+                                               : '-';
+    }
+    return kinds;
+}
+
+TEST(TrackNumbers, AreTheMoviesOwnIds) {
+    const Wrapper wrapper = OpenWithIds({3, 7, 5});
+    ASSERT_TRUE(wrapper);
+    EXPECT_EQ(Kinds(wrapper), "---v-a-a");
+    EXPECT_EQ(wrapper->GetDescribedTrackCount(), 3u);
+    EXPECT_EQ(Channels(wrapper, 7), 1u);
+    EXPECT_EQ(Channels(wrapper, 5), 2u);
+    EXPECT_EQ(Channels(wrapper, 3), 0u);
+    EXPECT_EQ(Channels(wrapper, 2), 0u);
+    EXPECT_EQ(wrapper->GetTrackDuration(7), 1000u);
+    EXPECT_EQ(wrapper->GetTrackDuration(5), 2000u);
+}
+
+// The highest that is looped to, and the first that is not.
+TEST(TrackNumbers, AreOneToNWhereAnIdIsTooHigh) {
+    EXPECT_EQ(OpenWithIds({1, 65535, 3})->GetNumberOfTracks(), 65535u);
+    const Wrapper wrapper = OpenWithIds({65536, 3, 5});
+    ASSERT_TRUE(wrapper);
+    EXPECT_EQ(wrapper->GetNumberOfTracks(), 3u);
+    // What has an id within 1 to n keeps it, so ids and numbers never disagree.
+    EXPECT_EQ(Kinds(wrapper), "-vaa");
+    EXPECT_EQ(Channels(wrapper, 3), 1u);
+    EXPECT_EQ(Channels(wrapper, 5), 2u);
+    EXPECT_EQ(Channels(wrapper, 2), 2u);
+    EXPECT_EQ(wrapper->IsVideoTrack(65536), 1);
+    EXPECT_EQ(wrapper->GetTrackDuration(3), 1000u);
+    EXPECT_EQ(wrapper->GetTrackDuration(2), 2000u);
+    EXPECT_EQ(wrapper->GetTrackDuration(5), 2000u);
+}
+
+TEST(TrackNumbers, AreOneToNWhereIdsAreTheSame) {
+    const Wrapper wrapper = OpenWithIds({9, 9, 9});
+    ASSERT_TRUE(wrapper);
+    EXPECT_EQ(Kinds(wrapper), "-vaa");
+    EXPECT_EQ(Channels(wrapper, 2), 1u);
+    EXPECT_EQ(Channels(wrapper, 3), 2u);
+}
+
+TEST(TrackNumbers, ServeTheReadersToo) {
+    const MadeMovie movie = MovieWithIds({65536, 3, 4000000000});
+    const Wrapper wrapper = OpenWrapper(movie.Path());
+    ASSERT_TRUE(wrapper);
+    host::Ref<QTWrapper::IQTAudioReader> reader;
+    host::Ref<QTWrapper::IQTWSampleTable> table;
+    ASSERT_EQ(wrapper->GetQTAudioReader(reader.Out()), NCF_OK);
+    ASSERT_EQ(wrapper->GetSampleTable(table.Out()), NCF_OK);
+    for (const ncfUInt32 track : {2u, 4000000000u}) {
+        ncfUInt32 channels = 0;
+        EXPECT_EQ(reader->SetParams(track, 3, 1, 48000.0, channels), NCF_OK);
+        EXPECT_EQ(channels, 2u);
+        ncfUInt64 count = 0;
+        EXPECT_EQ(table->GetNumSamples(track, &count), NCF_OK);
+        EXPECT_EQ(count, 2000u);
+    }
+}
+
+TEST(TrackNumbers, CountStreamsOfOtherContainers) {
+    NEEDS_FFMPEG();
+    for (const char* const ending : {".ts", ".mpg", ".avi", ".mkv"}) {
+        const MadeMovie movie(
+            "-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -f lavfi -i sine=d=0.4:r=48000 -c:v "
+            "mpeg2video "
+            "-c:a mp2",
+            ending);
+        EXPECT_EQ(Kinds(OpenWrapper(movie.Path())), "-va") << ending;
+    }
+}
+
+// A picture on the sleeve is no picture track, and takes no number that the
+// movie gives.
+TEST(TrackNumbers, LeavePicturesAttachedToSoundAside) {
+    NEEDS_FFMPEG();
+    for (const char* const ending : {".m4a", ".mp3"}) {
+        const MadeMovie movie(
+            "-f lavfi -i sine=d=0.4:r=48000 -f lavfi -i testsrc2=s=64x48:r=25:d=0.04 -map 0 -map 1 "
+            "-c:v mjpeg -disposition:v attached_pic",
+            ending);
+        const Wrapper wrapper = OpenWrapper(movie.Path());
+        ASSERT_TRUE(wrapper) << ending;
+        ncfUInt32 track = 7;
+        EXPECT_EQ(wrapper->GetFirstVideoTrack(&track), 0) << ending;
+        EXPECT_EQ(wrapper->MovieHasMultipleVideoTracks(0, 0), 0);
+        EXPECT_EQ(wrapper->IsAudioTrack(1), 1) << ending;
+        EXPECT_EQ(wrapper->GetNumberOfTracks(), 2u) << ending;
+    }
+}
+
+TEST(TrackDescriptions, TellVendorsOfAnyBytes) {
+    const auto vendorOf = [](const std::string& vendor) {
+        movies::Movie movie;
+        movies::VideoFormat format;
+        format.vendor = vendor;
+        movie.tracks.push_back(movies::VideoTrack(format, 10, 25, 1, 100));
+        ncfUInt32 value = 7;
+        EXPECT_EQ(OpenWrapper(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path())
+                      ->GetVendor(1, &value),
+                  NCF_OK);
+        return value;
+    };
+    EXPECT_EQ(vendorOf("appl"), Code("appl"));
+    EXPECT_EQ(vendorOf(""), 0u);
+    EXPECT_EQ(vendorOf(std::string("a\0\xFF"
+                                   "d",
+                                   4)),
+              0x6100FF64u);
+}
+
+TEST(TrackDescriptions, GiveTimecodeOnlyWhereItCounts) {
+    const auto answerFor = [](const movies::TimecodeFormat& format) {
+        movies::Movie movie;
+        movie.tracks = {movies::VideoTrack(movies::VideoFormat(), 10, 25, 1, 100),
+                        movies::TimecodeTrack(format, 90000, 10)};
+        const Wrapper wrapper =
+            OpenWrapper(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path());
+        EXPECT_EQ(wrapper->IsTimeCodeTrack(2), 1);
+        ncfUInt8 at[4] = {7, 7, 7, 7};
+        ncfUInt32 scale = 7, duration = 7, drop = 7, frames = 7;
+        const NCFRESULT result = wrapper->GetTimeCodeInfoForTrack(
+            2, at, at + 1, at + 2, at + 3, &scale, &duration, &drop, &frames);
+        if (result < 0) {
+            EXPECT_EQ(at[0] + at[1] + at[2] + at[3] + scale + duration + drop + frames, 7u * 8u);
+        } else {
+            EXPECT_EQ(at[0], 1);  // 90000 frames of 25
+            EXPECT_EQ(at[1] + at[2] + at[3], 0);
+            EXPECT_EQ(frames, 25u);
+        }
+        return result;
+    };
+    movies::TimecodeFormat format;
+    format.timeScale = 25;
+    format.frameDuration = 1;
+    format.numFrames = 25;
+    EXPECT_EQ(answerFor(format), NCF_OK);
+    movies::TimecodeFormat none = format;
+    none.numFrames = 0;
+    EXPECT_EQ(answerFor(none), NCF_E_FAIL);
+    none = format;
+    none.frameDuration = 0;
+    EXPECT_EQ(answerFor(none), NCF_E_FAIL);
+    none = format;
+    none.timeScale = 0;
+    EXPECT_EQ(answerFor(none), NCF_E_FAIL);
+}
+
+// The container's size and not the codec's, whatever was asked before.
+TEST(TrackDescriptions, KeepTheBoxOfTheMovie) {
+    NEEDS_FFMPEG();
+    const MadeMovie made("-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -c:v mjpeg -movflags +faststart");
+    Bytes content = made.Content();
+    const std::string text(content.begin(), content.end());
+    const std::size_t place = text.find("jpeg", text.find("stsd"));
+    content[place + 4 + 24 + 1] = 60;
+    content[place + 4 + 26 + 1] = 40;
+    const MadeMovie bent(content, ".mov");
+    const Wrapper wrapper = OpenWrapper(bent.Path());
+    ASSERT_TRUE(wrapper);
+    for (int i = 0; i < 2; ++i) {
+        ncfUInt32 width = 0, height = 0;
+        ASSERT_EQ(wrapper->GetMovieBox(&width, &height, nullptr, nullptr), NCF_OK);
+        EXPECT_EQ(width, 60u);
+        EXPECT_EQ(height, 40u);
+        host::Ref<QTWrapper::IQTVideoReader> reader;
+        ASSERT_EQ(wrapper->GetQTVideoReader(reader.Out()), NCF_OK);
+        ASSERT_EQ(reader->SetOutputPixelFormat(Code("2vuy"), 0, 0), NCF_OK);
+        EXPECT_EQ(reader->GetFrameBufferSize(0xFFFFFFFF, 0, 0), 60u * 40u * 2u);
+        ncfBool a = 0, b = 0;  // reads on for the codec's own word
+        ASSERT_EQ(wrapper->GetCodecColorSpaceInfo(&a, &b), NCF_OK);
+    }
+}
+
+}  // namespace
