@@ -33,6 +33,13 @@ make_movies() { # make_movies FOLDER
   make mpeg2_1080.mov -f lavfi -i "$hd" -c:v mpeg2video -b:v 25M
   make sound_only.mov -f lavfi -i "$tone" -c:a pcm_s24be -ac 2
   make one_picture.mov -f lavfi -i 'testsrc2=size=400x300:rate=25:duration=1' -frames:v 1 -c:v png
+  # The header parser gives these up; the movie wrapper opens them.
+  make fragmented.mp4 -f lavfi -i "$hd" -f lavfi -i "$tone" -c:v libx264 -bf 2 -c:a aac \
+    -movflags frag_keyframe+empty_moov
+  make mjpeg_pcm.avi -f lavfi -i 'testsrc2=size=640x480:rate=25:duration=2' -f lavfi -i "$tone" \
+    -c:v mjpeg -c:a pcm_s16le
+  make tone.wav -f lavfi -i "$tone" -c:a pcm_s24le -ac 2
+  make still.png -f lavfi -i 'testsrc2=size=400x300:rate=25:duration=1' -frames:v 1
 }
 
 if [ $# -eq 0 ]; then
