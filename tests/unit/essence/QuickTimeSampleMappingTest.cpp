@@ -468,6 +468,37 @@ TEST_F(SampleMapping, RefreshWithUnchangedSettingsAddsNothing) {
     EXPECT_EQ(Offered(0), before);
 }
 
+TEST_F(SampleMapping, RefreshAddsFormatsToTheAlphaTrackWhileTheClipShowsAlpha) {
+    AddVideo(1);
+    clip->setAlpha(true);
+    property->codes = {QuickTime::kBGRAPixelFormat};
+    Bind();
+    ASSERT_EQ(QueryImages(), NCF_OK);
+    ASSERT_EQ(Offered(0).size(), 1u);
+    ASSERT_EQ(Offered(1).size(), 1u);
+    clip->setFieldOrder(kTopFieldFirst);
+    EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_OK);
+    EXPECT_EQ(Offered(0).size(), 2u);
+    EXPECT_EQ(Offered(1).size(), 2u);
+    clip->setFieldOrder(kBottomFieldFirst);
+    clip->setIgnoreAlpha(true);
+    EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_OK);
+    EXPECT_EQ(Offered(0).size(), 3u);
+    EXPECT_EQ(Offered(1).size(), 2u) << "the track is there and not shown";
+}
+
+TEST_F(SampleMapping, RefreshIgnoresThatNoFormatCouldBeAdded) {
+    AddVideo(1);
+    property->codes = {QuickTime::k2vuyPixelFormat};
+    Bind();
+    ASSERT_EQ(QueryImages(), NCF_OK);
+    journal.clear();
+    clip->results["IsMultiFormatMovie"] = NCF_E_ABORT;
+    EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_OK);
+    EXPECT_EQ(journal.count("clip.IsMultiFormatMovie"), 1);
+    EXPECT_EQ(journal.count("clip.SetFieldLayoutDetails"), 1);
+}
+
 TEST_F(SampleMapping, RefreshBeforeTheFirstLookLooksAndIgnoresItsFailure) {
     AddVideo(1);
     Bind();
