@@ -3,9 +3,8 @@
 
 // From a request of the host to a filled buffer: one picture, or sound.
 
-#include <algorithm>
 #include <cstring>
-#include <memory>
+#include <vector>
 
 #include "source/essence/PixelLevels.h"
 #include "source/essence/ProviderLock.h"
@@ -97,14 +96,13 @@ NCFRESULT QuickTimeSampleMapping::ProvidePicture(MediaTrack& pictureTrack, ncfUI
 
 // Straight into the host's memory where nothing is to convert. A reader whose
 // frame is larger than the host's buffer must not write past its end: it gets a
-// block of its own, and what fits is copied.
+// block of its own, and what fits is copied. The block starts as zeros, so that
+// what a reader left out is nothing, and not what the memory held before.
 NCFRESULT QuickTimeSampleMapping::ReadPicture(const QTImageFormat& format, ncfUInt64 sample, ncfUInt32 width, ncfUInt32 height, ncfUInt32 nQuickTimeBufSize, ncfUInt8* pOutputBuffer, ncfUInt32 nOutputBufSize) {
     const PixelConversion convert = format.qt_params.convert;
-    std::unique_ptr<ncfUInt8[]> scratch;
-    if (convert || nQuickTimeBufSize > nOutputBufSize) {
-        scratch.reset(new ncfUInt8[nQuickTimeBufSize]);  // the reader fills all of it
-    }
-    NCFRESULT rc = _videoReaderHolder->ReadFrame(sample, scratch ? scratch.get() : pOutputBuffer, 0, 0, 0);
+    const bool readsAside = convert || nQuickTimeBufSize > nOutputBufSize;
+    std::vector<ncfUInt8> scratch(readsAside ? nQuickTimeBufSize : 0);
+    NCFRESULT rc = _videoReaderHolder->ReadFrame(sample, readsAside ? scratch.data() : pOutputBuffer, 0, 0, 0);
     if (rc != NCF_OK) {
         if (rc == NCF_E_ACCESSDENIED) {
             rc = kPictureAccessDenied;
@@ -114,9 +112,9 @@ NCFRESULT QuickTimeSampleMapping::ReadPicture(const QTImageFormat& format, ncfUI
         return rc;
     }
     if (convert) {
-        convert(scratch.get(), pOutputBuffer, nQuickTimeBufSize, nOutputBufSize, width, height);
-    } else if (scratch && nOutputBufSize != 0) {
-        std::memcpy(pOutputBuffer, scratch.get(), std::min(nQuickTimeBufSize, nOutputBufSize));
+        convert(scratch.data(), pOutputBuffer, nQuickTimeBufSize, nOutputBufSize, width, height);
+    } else if (readsAside && nOutputBufSize != 0) {
+        std::memcpy(pOutputBuffer, scratch.data(), nOutputBufSize);
     }
     return NCF_OK;
 }

@@ -78,6 +78,17 @@ TEST_F(Delivery, GivesTheFailureOfTheRequestUnderTheLock) {
         log->count(Record("80000006", "pAVBuffer->GetBuffer(&pBuffer)", "ProvideSampleRange")), 1);
 }
 
+TEST_F(Delivery, RequestWithoutABufferIsRefused) {
+    Movie({kBGRAPixelFormat});
+    Choose(0, 0);
+    ChooseSound(1);
+    Frame().assign(8, 0);
+    request->bufferless = true;
+    EXPECT_EQ(Ask(0), NCF_E_POINTER);
+    EXPECT_EQ(Ask(1), NCF_E_POINTER);
+    EXPECT_EQ(journal.lines().back(), "unlock");
+}
+
 TEST_F(Delivery, TrackThatIsNotThereIsInvalid) {
     Movie({kBGRAPixelFormat});
     EXPECT_EQ(Ask(9), NCF_E_INVALIDARG);
@@ -247,6 +258,21 @@ TEST_F(Delivery, ReaderSmallerThanTheBufferLeavesTheRest) {
     EXPECT_EQ(journal.count("buffer.SetComplete 3 4 0"), 1);
 }
 
+TEST_F(Delivery, WhatAReaderLeavesOutOfAConvertedFrameIsZero) {
+    Movie({kBGRAPixelFormat}, true);
+    Choose(1, 0);
+    clip->setSize(256, 1);
+    Frame().assign(1024, 9);
+    EXPECT_EQ(Ask(1), NCF_OK);
+    EXPECT_EQ(buffer->bytes, Bytes(256, 9));
+    wrapper->picture->frameSize = 1024;
+    Frame() = {1, 2, 3, 4};
+    EXPECT_EQ(Ask(1), NCF_OK);
+    Bytes expected(256, 0);
+    expected[0] = 4;
+    EXPECT_EQ(buffer->bytes, expected) << "nothing of the frame before";
+}
+
 TEST_F(Delivery, PictureWhoseSizeWrapsIsCutToTheBuffer) {
     Movie({kBGRAPixelFormat});
     Choose(0, 0);
@@ -308,6 +334,10 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfAPicture) {
     buffer->givesNull = false;
     mapping->_mediaTracks[0]->SetSelectedIndex(8);
     EXPECT_EQ(Ask(0), NCF_E_INVALIDARG);
+    EXPECT_EQ(log->count(Record("80000003",
+                                "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
+                                "ProvideSampleRange")),
+              1);
     mapping->_mediaTracks[0]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
     mapping->_mediaTracks[0]->SetSelectedIndex(1);
     EXPECT_EQ(Ask(0), NCF_E_POINTER);
@@ -415,14 +445,23 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfSound) {
         EXPECT_EQ(log->count(Record("80000007", call.second, "ProvideSampleRange")), 1);
     }
     buffer->results.clear();
+    buffer->givesNull = true;
+    EXPECT_EQ(Ask(1), NCF_E_POINTER) << "a buffer without memory";
+    buffer->givesNull = false;
     mapping->_trackRemapVect.assign(1, 1);
+    journal.clear();
     EXPECT_EQ(Ask(1), NCF_E_FAIL);
+    EXPECT_EQ(journal.count("buffer.GetBufferPointer"), 1) << "the buffer comes before the map";
     EXPECT_EQ(log->count(Record("80000008", "AAFTrackToQuickTimeTrack(trackNMA, &trackQT)",
                                 "ProvideSampleRange")),
               1);
     MediaTrack& track = *mapping->_mediaTracks[1];
     track.SetSelectedIndex(2);
     EXPECT_EQ(Ask(1), NCF_E_INVALIDARG);
+    EXPECT_EQ(log->count(Record("80000003",
+                                "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
+                                "ProvideSampleRange")),
+              1);
     track.AddFormat(QTAudioFormat(SF_PCM_INT_LE, 0, 24));
     EXPECT_EQ(Ask(1), NCF_E_FAIL);
     EXPECT_EQ(log->count(Check("NCFASSERT( bytesPerSample )", "ProvideSampleRange")), 1);
@@ -430,6 +469,16 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfSound) {
     track.SetSelectedIndex(3);
     EXPECT_EQ(Ask(1), NCF_E_POINTER);
     EXPECT_EQ(log->count(Check("CHK_PTR(audio_format)", "ProvideSampleRange")), 1);
+}
+
+TEST_F(Delivery, SoundNeedsATrackThatKeepsAChannelCount) {
+    Movie({kBGRAPixelFormat});
+    mapping->_mediaTracks[1].reset(new SoundTrackWithoutChannels);
+    mapping->_mediaTracks[1]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
+    EXPECT_EQ(Ask(1), NCF_E_POINTER);
+    EXPECT_EQ(log->count(Check("CHK_PTR(audio_track)", "ProvideSampleRange")), 1);
+    EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 0), NCF_E_POINTER);
+    EXPECT_EQ(log->count(Check("CHK_PTR(audio_track)", "SetWorkingAudioFormat")), 1);
 }
 
 TEST_F(Delivery, SoundBeforeTheAudioQueryIsNotInitialized) {

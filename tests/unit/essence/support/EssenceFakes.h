@@ -129,8 +129,7 @@ public:
     ncfUInt32 lastTrack = 0;
 };
 
-// Memory that tells when it was asked for and handed over; a guard behind the
-// end shows writes past it.
+// Memory that tells when it was asked for and handed over.
 class FakeBuffer : public FakeObject<INCFBuffer>, public FakeCalls {
 public:
     explicit FakeBuffer(Journal* lines, std::string name = "buffer")
@@ -172,8 +171,11 @@ public:
     ncfUInt32 track = 0;
     ncfUInt64 sample = 0;
     ncfUInt64 count = 1;
+    bool bufferless = false;  // succeeds and gives no buffer
 
-    NCFRESULT GetBuffer(INCFBuffer** out) override { return giveObject("GetBuffer", out, buffer_); }
+    NCFRESULT GetBuffer(INCFBuffer** out) override {
+        return giveObject("GetBuffer", out, bufferless ? nullptr : buffer_);
+    }
     NCFRESULT GetSampleRange(ncfUInt32* outTrack, ncfUInt64* outSample,
                              ncfUInt64* outCount) override {
         const NCFRESULT result = enter("GetSampleRange");

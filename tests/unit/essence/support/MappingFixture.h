@@ -32,6 +32,12 @@ public:
     using QuickTimeSampleMapping::QuickTimeSampleMapping;
 };
 
+// Calls itself sound, but can't keep a channel count.
+class SoundTrackWithoutChannels final : public MediaTrack {
+public:
+    ncfUInt32 GetTrackType() const override { return kAudio; }
+};
+
 // A mapping over a fake clip, with its host, its readers and a journal of all
 // that they are asked. Tests set the clip up, then `Bind`.
 class MappingFixture : public testing::Test {
