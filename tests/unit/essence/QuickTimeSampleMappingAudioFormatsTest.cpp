@@ -126,6 +126,9 @@ TEST_F(AudioFormats, ChoicePastTheEndLeavesTheIndexChanged) {
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 5), NCF_E_INVALIDARG);
     EXPECT_EQ(mapping->_mediaTracks[1]->GetSelectedIndex(), 5u);
     EXPECT_FALSE(mapping->_mediaTracks[1]->GetSelectedFormat());
+    EXPECT_EQ(log->count(Record("80000003", "track->GetMediaFormat(formatIndex, mediaFormat)",
+                                "SetWorkingAudioFormat")),
+              1);
     EXPECT_EQ(journal.startingWith("sound.").size(), 0u);
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 1), NCF_OK);
     EXPECT_FALSE(mapping->_mediaTracks[1]->GetSelectedFormat()) << "never set for sound";
@@ -135,7 +138,16 @@ TEST_F(AudioFormats, ChoiceNeedsASoundTrackBeforeTheLock) {
     EXPECT_EQ(mapping->SetWorkingAudioFormat(0, 0), NCF_E_INVALIDARG);
     EXPECT_TRUE(log->records().empty());
     EXPECT_EQ(mapping->SetWorkingAudioFormat(9, 0), NCF_E_INVALIDARG);
+    EXPECT_EQ(
+        log->count(Record("80000003", "GetMediaTrack(trackNMA, track)", "SetWorkingAudioFormat")),
+        1);
     EXPECT_TRUE(journal.lines().empty());
+}
+
+TEST_F(AudioFormats, ChoiceKeepsItsIndexThenMapsItsTrackThenLooksForTheFormat) {
+    mapping->_trackRemapVect.assign(1, 3);
+    EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 5), NCF_E_FAIL) << "the map, not the format";
+    EXPECT_EQ(mapping->_mediaTracks[1]->GetSelectedIndex(), 5u);
 }
 
 TEST_F(AudioFormats, ChoiceGivesTheFailureOfEachStep) {

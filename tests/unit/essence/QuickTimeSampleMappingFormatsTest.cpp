@@ -257,6 +257,35 @@ TEST_F(SampleMappingFormats, GivesTheClipsFailureWithTheTextOfItsRow) {
               1);
 }
 
+TEST_F(SampleMappingFormats, FailureAtTheAlphaStepLeavesThePictureFormat) {
+    struct Row {
+        ncfUInt32 code;
+        const char* type;
+        const char* line;
+    };
+    const Row rows[] = {{kBGRAPixelFormat, "CT_UCHAR", "Adding support for BGRA.\n"},
+                        {kb64aPixelFormat, "CT_10Bit", "Adding support for 'b64a'.\n"},
+                        {kr4flPixelFormat, "CT_10Bit", "Adding support for 'r4fl'.\n"}};
+    Movie(true);
+    clip->results["GetBufferLineOrientation"] = NCF_E_ABORT;
+    for (const Row& row : rows) {
+        log->clear();
+        host->console().clear();
+        clip->spared["GetBufferLineOrientation"] = 1;
+        EXPECT_EQ(Add(row.code), NCF_E_ABORT);
+        EXPECT_EQ(log->count(Record("80000007",
+                                    std::string("AddImagePixelFormat(alpha_track, PF_Mono, "
+                                                "CSS_None, CS_MONO, ") +
+                                        row.type + ", CRT_UNDEFINED, qt_params)",
+                                    "AddPixelFormat")),
+                  1)
+            << CodeText(row.code);
+        EXPECT_EQ(ConsoleTexts(), Lines{std::string("4: ") + row.line});
+    }
+    EXPECT_EQ(Offered(0).size(), 3u);
+    EXPECT_EQ(Offered(1), kNothing);
+}
+
 TEST_F(SampleMappingFormats, ClipWithoutFieldOrderHasNoFormats) {
     Movie();
     clip->setFieldOrder(kPropertyNotSet);
@@ -315,6 +344,65 @@ TEST_F(SampleMappingFormats, CodecWithoutFormatsGives2vuy) {
     Movie();
     EXPECT_EQ(QueryImages(), NCF_OK);
     EXPECT_EQ(Offered(0), Lines{"2/1/8/1/1 <- 2vuy"});
+}
+
+// The list without codes is walked like any other and ends at the same format.
+TEST_F(SampleMappingFormats, CodecWithoutFormatsIsAskedForSeveralAllTheSame) {
+    Movie();
+    clip->results["IsMultiFormatMovie"] = NCF_E_ABORT;
+    EXPECT_EQ(QueryImages(), NCF_E_ABORT);
+    EXPECT_EQ(Offered(0).size(), 1u);
+    EXPECT_TRUE(mapping->_imageFormatsReady) << "there is a format, whatever failed after it";
+    clip->results.clear();
+    host->console().clear();
+    EXPECT_EQ(mapping->AddDecompressorPixelFormats(mapping->_mediaTracks[0].get(), nullptr),
+              NCF_OK);
+    EXPECT_EQ(Offered(0), Lines{"2/1/8/1/1 <- 2vuy"});
+    EXPECT_EQ(Console(4, "Adding support for '2vuy'.\n"), 2) << "told, though it is there";
+}
+
+TEST_F(SampleMappingFormats, LastResortFailsOnAClipWithAlpha) {
+    Movie(true);
+    const auto* const record =
+        "AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat, "
+        "_codecSupportsRGB_CCIR)";
+    property->codes = {kv210PixelFormat, k2vuyPixelFormat, 5};
+    EXPECT_EQ(QueryImages(), NCF_E_FAIL) << "no code of the list makes a format";
+    EXPECT_EQ(log->count(Record("80000008", record, "AddDecompressorPixelFormats")), 1);
+    property->codes = {kBGRAPixelFormat};
+    clip->multiFormat = 1;
+    EXPECT_EQ(QueryImages(), NCF_E_FAIL) << "no codec's own formats for several";
+    EXPECT_EQ(log->count(Record("80000008", record, "AddDecompressorPixelFormats")), 2);
+    EXPECT_EQ(Offered(0), kNothing);
+    EXPECT_EQ(Offered(1), kNothing);
+    EXPECT_EQ(Console(2, "No one image pixel format was added for video track.\n"), 2);
+    EXPECT_EQ(Console(2, "No one image pixel format was added for alpha track.\n"), 2);
+    clip->multiFormat = 0;
+    EXPECT_EQ(QueryImages(), NCF_OK);
+    EXPECT_EQ(Offered(0), Lines{"8/4/2/1/2 <- BGRA"});
+}
+
+TEST_F(SampleMappingFormats, AlphaTrackAloneCanBeLeftWithoutFormats) {
+    Movie(true);
+    property->codes = {kNVZ2PixelFormat};
+    EXPECT_EQ(QueryImages(), NCF_OK);
+    EXPECT_EQ(Offered(0), Lines{"8/4/2/1/1 <- NVZ2"});
+    EXPECT_EQ(Console(2, "No one image pixel format was added for video track.\n"), 0);
+    EXPECT_EQ(Console(2, "No one image pixel format was added for alpha track.\n"), 1);
+    EXPECT_TRUE(mapping->_imageFormatsReady) << "the picture decides";
+}
+
+TEST_F(SampleMappingFormats, AlphaThatIsIgnoredIsNoAlpha) {
+    Movie();
+    mapping->_mediaTracks.emplace_back(new VideoMediaTrack(MediaTrack::kVideoAlpha));
+    clip->setAlpha(true);
+    clip->setIgnoreAlpha(true);
+    property->storageType = 1;
+    property->codes = {k2vuyPixelFormat, kBGRAPixelFormat};
+    EXPECT_EQ(QueryImages(), NCF_OK);
+    EXPECT_EQ(Offered(0), (Lines{"2/1/8/1/1 <- 2vuy", "8/4/2/1/2 <- BGRA"}));
+    EXPECT_EQ(Offered(1), kNothing);
+    EXPECT_EQ(Console(2, "No one image pixel format was added for alpha track.\n"), 0);
 }
 
 TEST_F(SampleMappingFormats, CodecWithoutFormatsGivesNothingToAClipWithAlpha) {

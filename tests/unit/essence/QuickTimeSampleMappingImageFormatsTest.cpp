@@ -378,6 +378,9 @@ TEST_F(ImageFormats, AlignmentIsWrittenEvenWhenTheRequirementsFail) {
     EXPECT_EQ(alignment, 1);
     clip->results["GetEncodedWidthAndHeight"] = NCF_E_ABORT;
     EXPECT_EQ(mapping->GetWorkingImageBufferRequirements(0, &alignment, &size), NCF_E_ABORT);
+    EXPECT_EQ(log->count(Record("80000007", "media_->GetEncodedWidthAndHeight(&width, &height)",
+                                "GetWorkingImageBufferRequirements")),
+              1);
     EXPECT_EQ(size, 77u);
 }
 
