@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/parameters/RegisterParameterComponents.h"
 #include "reference_host/quicktime/RegisterQuickTimeComponents.h"
 #include "reference_host/util/text/Paths.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
@@ -68,6 +69,7 @@ Session::Session(const SessionOptions& options) {
         }
     });
     host::RegisterXmlComponents(*host_);
+    host::RegisterParameterComponents(*host_);
     host_->RegisterComponent(NCFCompID_QTParser, header_parser::QTParserMaker());
     host::RegisterQuickTimeComponents(*host_);
 

@@ -13,6 +13,7 @@ namespace cliphost {
 void AddScan(CLI::App& app, const SessionOptions& session, int& status);
 void AddDescribe(CLI::App& app, const SessionOptions& session, int& status);
 void AddTypes(CLI::App& app, const SessionOptions& session, int& status);
+void AddParams(CLI::App& app, const SessionOptions& session, int& status);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
 
 }  // namespace cliphost

@@ -70,6 +70,7 @@ int main(int argc, char** argv) {
     AddScan(app, session, status);
     AddDescribe(app, session, status);
     AddTypes(app, session, status);
+    AddParams(app, session, status);
     AddPlugin(app, session, status);
 
     try {

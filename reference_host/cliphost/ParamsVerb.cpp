@@ -1,0 +1,146 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include <fmt/format.h>
+
+#include <map>
+#include <nlohmann/json.hpp>
+
+#include "host_interfaces/media/MediaContainer.h"
+#include "host_interfaces/media/PluginComponents.h"
+#include "host_interfaces/media/SampleMapping.h"
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using host::DisplayPath;
+
+struct ParamsOptions {
+    std::filesystem::path movie;
+    ParameterOptions parameters;
+    std::string xml;
+    bool json = false;
+};
+
+const std::map<std::string, ParameterXml> kXml = {{"values", ParameterXml::kValues},
+                                                  {"description", ParameterXml::kDescription},
+                                                  {"defaults", ParameterXml::kDefaults}};
+
+host::Ref<NMA::ISampleMapping> Map(Session& session, const std::filesystem::path& movie) {
+    const auto path = PathForModule(movie);
+    host::Ref<NMA::IMediaContainer3> container;
+    host::Ref<NMA::ISampleMapping> mapping;
+    NCFRESULT result = session.host().Create(NMA::CompID_QuickTimeContainer, container);
+    if (result >= 0) {
+        result = container->SetFilePath(path.get());
+    }
+    if (result >= 0) {
+        result = container->GetSampleMapping(mapping.Out());
+    }
+    if (result < 0) {
+        std::string message =
+            fmt::format("{}: not opened: {}", DisplayPath(movie), ResultText(result));
+        for (const std::string& notice : session.TakeNotices()) {
+            message += "\n  the module said: " + notice;
+        }
+        throw Failure(kExitFile, message);
+    }
+    return mapping;
+}
+
+// All choices of a parameter, a star at the one in use. A number that is none of
+// them is the file's own way.
+void PrintParameter(const ClipParameter& parameter) {
+    const auto line = [&](const std::string& text, std::optional<ncfUInt32> value) {
+        fmt::print("    {} {}{}\n", parameter.value == value ? '*' : ' ', text,
+                   parameter.defaultValue == value ? " (default)" : "");
+    };
+    const auto isChoice = [&](std::optional<ncfUInt32> value) {
+        for (const host::ParameterChoice& choice : parameter.info.choices) {
+            if (value == choice.value) {
+                return true;
+            }
+        }
+        return false;
+    };
+    fmt::print("  {} (\"{}\")\n", parameter.info.label, parameter.info.name);
+    for (const host::ParameterChoice& choice : parameter.info.choices) {
+        line(choice.text, choice.value);
+    }
+    const auto other = [&](std::optional<ncfUInt32> value) {
+        if (!isChoice(value)) {
+            line(value ? fmt::format("none of these: {}", *value) : "no value", value);
+        }
+    };
+    other(parameter.value);
+    if (parameter.defaultValue != parameter.value) {
+        other(parameter.defaultValue);
+    }
+}
+
+nlohmann::ordered_json ToJson(const ClipParameter& parameter) {
+    const auto number = [](std::optional<ncfUInt32> value) {
+        return value ? nlohmann::ordered_json(*value) : nlohmann::ordered_json();
+    };
+    nlohmann::ordered_json choices = nlohmann::ordered_json::array();
+    for (const host::ParameterChoice& choice : parameter.info.choices) {
+        choices.push_back({{"value", choice.value}, {"text", choice.text}});
+    }
+    return {{"name", parameter.info.name},
+            {"label", parameter.info.label},
+            {"value", number(parameter.value)},
+            {"default", number(parameter.defaultValue)},
+            {"choices", std::move(choices)}};
+}
+
+void Print(ClipParameters& parameters, const ParamsOptions& options) {
+    if (!options.xml.empty()) {
+        fmt::print("{}\n", parameters.Xml(kXml.at(options.xml)));
+        return;
+    }
+    const std::vector<ClipParameter> list = parameters.List();
+    const std::string set = parameters.SetName();
+    if (!options.json) {
+        fmt::print("{}: {}\n", DisplayPath(options.movie), set);
+        for (const ClipParameter& parameter : list) {
+            PrintParameter(parameter);
+        }
+        return;
+    }
+    nlohmann::ordered_json json = {{"movie", DisplayPath(options.movie)},
+                                   {"set", set},
+                                   {"parameters", nlohmann::ordered_json::array()}};
+    for (const ClipParameter& parameter : list) {
+        json["parameters"].push_back(ToJson(parameter));
+    }
+    fmt::print("{}\n", json.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
+}
+
+}  // namespace
+
+void AddParams(CLI::App& app, const SessionOptions& session, int&) {
+    auto* const verb = app.add_subcommand("params", "Show and change the parameters of a movie");
+    verb->footer(
+        "Example: cliphost params clip.mov --set \"Level Remapping=Expand\" --xml values > my.xml");
+    auto options = std::make_shared<ParamsOptions>();
+    verb->add_option("movie", options->movie, "A movie")->required();
+    options->parameters.AddTo(*verb);
+    auto* const xml = verb->add_option("--xml", options->xml,
+                                       "Print a document: values, description or defaults");
+    xml->check(CLI::IsMember(kXml));
+    verb->add_flag("--json", options->json, "As JSON")->excludes(xml);
+    verb->callback([&session, options] {
+        Session running(session);
+        const auto mapping = Map(running, options->movie);
+        ClipParameters parameters(running, options->movie, *mapping);
+        options->parameters.ApplyTo(parameters);
+        Print(parameters, *options);
+    });
+}
+
+}  // namespace cliphost
