@@ -4,49 +4,12 @@
 
 #include <random>
 
+#include "tests/unit/quicktime/AskEverything.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;
 
 namespace {
-
-// Asks everything of a file; only that it comes back is expected.
-void AskEverything(const std::filesystem::path& path) {
-    const auto wrapper = OpenWrapper(path);
-    if (!wrapper) {
-        return;
-    }
-    ncfSInt32 num = 0, den = 0;
-    ncfUInt64 length = 0;
-    wrapper->DetermineMovieEditRateAndLength(0, 25, 0, &num, &den, &length, nullptr, 0, 1);
-    ncfBool a = 0, b = 0;
-    wrapper->MovieTrackDurationIssues(25, 1, 10, &a, &b);
-    wrapper->MovieContainsAlpha(QTWrapper::kAlphaCheckForQTNMA, &a);
-    host::Ref<QTWrapper::IQTVideoReader> video;
-    if (wrapper->GetQTVideoReader(video.Out()) == NCF_OK && video->InitQT(0) == NCF_OK) {
-        video->SetOutputPixelFormat(Code("2vuy"), 0, 0);
-        if (video->GetFrameBufferSize(0xFFFFFFFF, 0, 0) < (1u << 24)) {
-            for (const ncfUInt64 number : {0u, 9u, 3u, 20u}) {
-                Picture(*video, number);
-            }
-        }
-    }
-    host::Ref<QTWrapper::IQTAudioReader> audio;
-    wrapper->GetQTAudioReader(audio.Out());
-    host::Ref<QTWrapper::IQTWSampleTable> table;
-    wrapper->GetSampleTable(table.Out());
-    for (ncfUInt32 track = 1; track <= wrapper->GetNumberOfTracks() && track < 10; ++track) {
-        ncfUInt32 channels = 0;
-        if (audio && audio->SetParams(track, 3, 1, 48000.0, channels) == NCF_OK) {
-            Bytes room(3000);
-            ncfUInt64 count = 100;
-            audio->ReadSamples(track, 500, &count, room.data(), room.size(), 0, 0);
-        }
-        ncfUInt64 next = 0;
-        table->GetNextDiscontiguousDataAttributeChange(track, 1, &next);
-        table->GetMaxDataSize(track);
-    }
-}
 
 Bytes SmallMovie() {
     return MadeMovie(
@@ -61,7 +24,7 @@ TEST(HostileMovies, CutAnywhereComeBack) {
     for (std::size_t size = 0; size < whole.size(); size += 97) {
         const MadeMovie cut(Bytes(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(size)),
                             ".mov");
-        AskEverything(cut.Path());
+        EXPECT_STREQ(AskEverything(cut.Path()), nullptr);
     }
 }
 
@@ -78,7 +41,7 @@ TEST(HostileMovies, WithBitsTurnedComeBack) {
                 static_cast<std::uint8_t>(1u << random() % 8);
         }
         SCOPED_TRACE(i);
-        AskEverything(MadeMovie(broken, ".mov").Path());
+        EXPECT_STREQ(AskEverything(MadeMovie(broken, ".mov").Path()), nullptr);
     }
 }
 
@@ -94,9 +57,8 @@ TEST(HostileMovies, FilesOfNothingAreRefused) {
 TEST(HostileMovies, ListsReachNoOtherFiles) {
     const std::string list = "ffconcat version 1.0\nfile 'http://127.0.0.1:9/a.mov'\n";
     const MadeMovie file(Bytes(list.begin(), list.end()), ".ffconcat");
-    AskEverything(file.Path());
-    const auto wrapper = OpenWrapper(file.Path());
-    EXPECT_TRUE(!wrapper || wrapper->GetNumberOfTracks() == 0);
+    EXPECT_STREQ(AskEverything(file.Path()), nullptr);
+    EXPECT_FALSE(OpenWrapper(file.Path()));
 }
 
 }  // namespace
