@@ -15,10 +15,22 @@
 namespace cliphost {
 namespace {
 
-// What went wrong with a movie, and what would help.
-std::string Problem(Session& session, const std::filesystem::path& movie, NCFRESULT result) {
+void Finish(Session& session, Description& description) {
+    if (description.result < 0) {
+        description.file.Reset();
+        description.problem =
+            ProblemWith(session, description.movie, "not described", description.result);
+    } else {
+        session.TakeNotices();
+    }
+}
+
+}  // namespace
+
+std::string ProblemWith(Session& session, const std::filesystem::path& movie, const char* what,
+                        NCFRESULT result) {
     std::string text =
-        fmt::format("{}: not described: {}", host::DisplayPath(movie), ResultText(result));
+        fmt::format("{}: {}: {}", host::DisplayPath(movie), what, ResultText(result));
     for (const std::string& notice : session.TakeNotices()) {
         text += "\n  the module said: " + notice;
     }
@@ -33,30 +45,32 @@ std::string Problem(Session& session, const std::filesystem::path& movie, NCFRES
     return text;
 }
 
-void Finish(Session& session, Description& description) {
-    if (description.result < 0) {
-        description.file.Reset();
-        description.problem = Problem(session, description.movie, description.result);
-    } else {
-        session.TakeNotices();
-    }
+NCFRESULT OpenContainer(Session& session, const std::filesystem::path& movie,
+                        host::Ref<NMA::IMediaContainer3>& container) {
+    const auto path = PathForModule(movie);
+    const NCFRESULT made = session.host().Create(NMA::CompID_QuickTimeContainer, container);
+    return made < 0 ? made : container->SetFilePath(path.get());
 }
 
-}  // namespace
-
 Description DescribeMovie(Session& session, const std::filesystem::path& movie) {
+    host::Ref<NMA::IMediaContainer3> container;
+    const NCFRESULT opened = OpenContainer(session, movie, container);
+    if (opened >= 0) {
+        return DescribeContainer(session, container.get(), movie);
+    }
     Description description;
     description.movie = movie;
-    const auto path = PathForModule(movie);
-    host::Ref<NMA::IMediaContainer3> container;
+    description.result = opened;
+    Finish(session, description);
+    return description;
+}
+
+Description DescribeContainer(Session& session, NMA::IMediaContainer3* container,
+                              const std::filesystem::path& movie) {
+    Description description;
+    description.movie = movie;
     host::Ref<NMA::IAAFClips> clips;
-    NCFRESULT result = session.host().Create(NMA::CompID_QuickTimeContainer, container);
-    if (result >= 0) {
-        result = container->SetFilePath(path.get());
-    }
-    if (result >= 0) {
-        result = container->GetAAFMasterClips(clips.Out());
-    }
+    NCFRESULT result = container->GetAAFMasterClips(clips.Out());
     if (result >= 0) {
         result = clips->GetMetadata(0, description.file.Out());
     }

@@ -5,7 +5,7 @@
 #include <filesystem>
 #include <string>
 
-#include "host_interfaces/media/AAFClips.h"
+#include "host_interfaces/media/MediaContainer.h"
 #include "reference_host/cliphost/Session.h"
 
 namespace cliphost {
@@ -20,8 +20,19 @@ struct Description {
 
 // Opens a movie through the module's container and lets it be described.
 Description DescribeMovie(Session& session, const std::filesystem::path& movie);
+// The module's container for a movie, which is not looked into yet. A failure
+// is the module's; one of the path throws.
+NCFRESULT OpenContainer(Session& session, const std::filesystem::path& movie,
+                        host::Ref<NMA::IMediaContainer3>& container);
+Description DescribeContainer(Session& session, NMA::IMediaContainer3* container,
+                              const std::filesystem::path& movie);
 // The description at an index of the module's list of a folder.
 Description DescribeFromList(Session& session, NMA::IAAFClips* list, ncfSInt32 index,
                              const std::filesystem::path& movie);
+
+// For the user: what the module would not do with a movie, why, and what would
+// help. Takes the session's notices.
+std::string ProblemWith(Session& session, const std::filesystem::path& movie, const char* what,
+                        NCFRESULT result);
 
 }  // namespace cliphost

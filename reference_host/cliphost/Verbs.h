@@ -12,6 +12,11 @@ namespace cliphost {
 // it does runs once the whole line is read; `status` becomes the exit status.
 void AddScan(CLI::App& app, const SessionOptions& session, int& status);
 void AddDescribe(CLI::App& app, const SessionOptions& session, int& status);
+void AddSamples(CLI::App& app, const SessionOptions& session, int& status);
+void AddFormats(CLI::App& app, const SessionOptions& session, int& status);
+void AddFrame(CLI::App& app, const SessionOptions& session, int& status);
+void AddContact(CLI::App& app, const SessionOptions& session, int& status);
+void AddAudio(CLI::App& app, const SessionOptions& session, int& status);
 void AddTypes(CLI::App& app, const SessionOptions& session, int& status);
 void AddParams(CLI::App& app, const SessionOptions& session, int& status);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);

@@ -24,7 +24,9 @@ int main(int argc, char** argv) {
     session.programFolder = ProgramFolder(argv[0]);
     int status = kExitFine;
 
-    CLI::App app{"Hosts the QuickTime plug-in: scans folders, describes movies, saves AAF files."};
+    CLI::App app{
+        "Hosts the QuickTime plug-in: scans folders, describes movies as AAF, "
+        "maps and delivers their pictures and sound."};
     app.name("cliphost");
     app.require_subcommand(1);
     app.fallthrough();
@@ -69,6 +71,11 @@ int main(int argc, char** argv) {
 
     AddScan(app, session, status);
     AddDescribe(app, session, status);
+    AddSamples(app, session, status);
+    AddFormats(app, session, status);
+    AddFrame(app, session, status);
+    AddContact(app, session, status);
+    AddAudio(app, session, status);
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);

@@ -1,0 +1,119 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <fmt/format.h>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/SoundReader.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using host::DisplayPath;
+
+struct AudioOptions {
+    std::filesystem::path movie;
+    std::optional<ncfUInt32> track;
+    std::uint64_t start = 0;
+    std::optional<std::uint64_t> count;
+    std::filesystem::path output;
+};
+
+constexpr std::uint64_t kBlock = 65536;  // samples of each channel read at a time
+
+std::uint64_t WantedCount(const AudioOptions& options, const SoundReader& sound) {
+    if (options.start >= sound.Count()) {
+        throw Failure(kExitCaller,
+                      fmt::format("{}: there is no sample {} of sound; it has {}, from 0 on",
+                                  DisplayPath(options.movie), options.start, sound.Count()));
+    }
+    const std::uint64_t left = sound.Count() - options.start;
+    if (options.count && *options.count > left) {
+        fmt::print(stderr,
+                   "cliphost: {}: only {} samples follow sample {}; all of them are "
+                   "written\n",
+                   DisplayPath(options.movie), left, options.start);
+    }
+    return std::min(options.count.value_or(left), left);
+}
+
+// The number of samples that came as silence since they could not be read.
+std::uint64_t Copy(SoundReader& sound, std::uint64_t start, std::uint64_t count,
+                   OutputFile& output) {
+    std::uint64_t silent = 0;
+    Progress progress("sound", static_cast<std::size_t>((count + kBlock - 1) / kBlock));
+    for (std::uint64_t done = 0; done < count; done += kBlock) {
+        progress.Step(fmt::format("{} of {} samples", done, count));
+        const std::uint64_t now = std::min(kBlock, count - done);
+        const SoundReader::Block block = sound.Read(start + done, now);
+        silent += block.isSilence ? now : 0;
+        output.Write(block.bytes, block.size);
+    }
+    return silent;
+}
+
+int WriteSound(Essence& essence, const AudioOptions& options) {
+    const ClipTrack& track = essence.Track(options.track, TrackKind::Sound);
+    SoundReader sound(essence, track);
+    const std::uint64_t count = WantedCount(options, sound);
+    const std::vector<unsigned char> header = WavHeader(sound.form(), count);
+    if (header.empty()) {
+        throw Failure(kExitFile, fmt::format("{}: {} channels at {} Hz are no form of a WAV file",
+                                             DisplayPath(options.movie), sound.form().channels,
+                                             sound.form().rate));
+    }
+    std::error_code ignored;
+    if (std::filesystem::equivalent(options.output, options.movie, ignored)) {
+        throw Failure(kExitCaller,
+                      fmt::format("{}: this is the movie itself", DisplayPath(options.output)));
+    }
+    std::uint64_t silent = 0;
+    try {
+        OutputFile output(options.output);
+        output.Write(header.data(), header.size());
+        silent = Copy(sound, options.start, count, output);
+        if (WavNeedsPadding(sound.form(), count)) {
+            output.Write("", 1);
+        }
+        output.Finish();
+    } catch (const ReaderGone&) {
+        return kExitFine;
+    }
+    if (!OutputFile::IsStandardOutput(options.output)) {
+        fmt::print("{}: {} samples of {} channels, 24 bits at {} Hz\n", DisplayPath(options.output),
+                   count, sound.form().channels, sound.form().rate);
+    }
+    if (silent > 0) {
+        fmt::print(stderr, "cliphost: {}: {} of {} samples could not be read and are silence\n",
+                   DisplayPath(options.movie), silent, count);
+    }
+    return silent == 0 ? kExitFine : kExitFile;
+}
+
+}  // namespace
+
+void AddAudio(CLI::App& app, const SessionOptions& session, int& status) {
+    auto* const verb =
+        app.add_subcommand("audio", "Write the sound of a track as a WAV file of 24 bits");
+    verb->footer(
+        "Example: cliphost audio clip.mov --start 48000 --count 96000 -o piece.wav\n"
+        "A file past 4 GiB is an RF64, which WAV programs know.");
+    auto options = std::make_shared<AudioOptions>();
+    verb->add_option("movie", options->movie, "The movie")->required();
+    verb->add_option("--track", options->track, "Its number; the first sound when not given");
+    verb->add_option("--start", options->start, "The first sample, from 0")->capture_default_str();
+    verb->add_option("--count", options->count, "How many samples; all when not given")
+        ->check(CLI::PositiveNumber);
+    verb->add_option("-o,--output", options->output, "The WAV file, or - for standard output")
+        ->required();
+    verb->callback([&session, &status, options] {
+        Session running(session);
+        Essence essence(running, options->movie);
+        status = WriteSound(essence, *options);
+    });
+}
+
+}  // namespace cliphost

@@ -1,0 +1,121 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <fmt/format.h>
+
+#include <cmath>
+
+#include "reference_host/cliphost/ContactSheet.h"
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/FrameRange.h"
+#include "reference_host/cliphost/FrameReader.h"
+#include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/PixelsToPicture.h"
+#include "reference_host/cliphost/PngFile.h"
+#include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using host::DisplayPath;
+
+struct ContactOptions {
+    std::filesystem::path movie;
+    std::filesystem::path output;
+    int frames = 12;
+    int columns = 4;
+    int width = 320;
+    ParameterOptions parameters;
+};
+
+// Cells have the shape in which the clip is shown, whatever its pixels are.
+int CellHeight(const ContactOptions& options, const ClipTrack& track, const FrameReader& reader) {
+    const aafRational_t& shape = track.shape;
+    const double told = shape.denominator > 0 && shape.numerator > 0
+                            ? static_cast<double>(shape.denominator) / shape.numerator
+                            : static_cast<double>(reader.height()) / reader.width();
+    const double height = options.width * std::clamp(told, 0.05, 20.0);
+    return std::max(1, static_cast<int>(std::lround(height)));
+}
+
+int WriteSheet(Essence& essence, const ContactOptions& options) {
+    const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
+    FrameReader reader(essence, track, "");
+    std::unique_ptr<FrameReader> alpha;
+    if (const ClipTrack* const shown = essence.First(TrackKind::Alpha)) {
+        alpha = std::make_unique<FrameReader>(essence, *shown, "");
+    }
+    const auto frames = SpreadFrames(reader.Count(), static_cast<std::uint64_t>(options.frames));
+    if (frames.empty() || reader.width() == 0) {
+        throw Failure(kExitFile, fmt::format("{}: it has no frames", DisplayPath(options.movie)));
+    }
+    ContactSheet sheet(static_cast<int>(frames.size()), options.columns, options.width,
+                       CellHeight(options, track, reader));
+    Progress progress("frames", frames.size());
+    std::size_t failed = 0;
+    for (const std::uint64_t frame : frames) {
+        progress.Step(fmt::format("{}", frame));
+        NCFRESULT result = reader.Read(frame);
+        Picture picture = result == NCF_OK ? reader.ToPicture() : Picture();
+        if (result == NCF_OK && alpha) {
+            result = alpha->Read(frame);
+            picture = WithAlpha(picture, alpha->ToPicture());
+        }
+        if (result != NCF_OK) {
+            ++failed;
+            picture = {};  // its cell stays empty
+            fmt::print(stderr, "cliphost: {}: frame {} could not be read: {}\n",
+                       DisplayPath(options.movie), frame, ResultText(result));
+        }
+        sheet.Add(picture);
+    }
+    if (failed == frames.size()) {
+        throw Failure(kExitFile, fmt::format("{}: no frame could be read, so there is no sheet",
+                                             DisplayPath(options.movie)));
+    }
+    const std::vector<unsigned char> png = ToPng(sheet.picture());
+    OutputFile output(options.output);
+    output.Write(png.data(), png.size());
+    output.Finish();
+    if (!OutputFile::IsStandardOutput(options.output)) {
+        fmt::print("{}: {} of {} frames\n", DisplayPath(options.output), frames.size() - failed,
+                   reader.Count());
+    }
+    return failed == 0 ? kExitFine : kExitFile;
+}
+
+}  // namespace
+
+void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
+    auto* const verb =
+        app.add_subcommand("contact",
+                           "Write a contact sheet: small pictures of frames all through "
+                           "a movie");
+    verb->footer(
+        "Example: cliphost contact clip.mov -o sheet.png\n"
+        "With --use-alpha a checkerboard shows through what is transparent.");
+    auto options = std::make_shared<ContactOptions>();
+    verb->add_option("movie", options->movie, "The movie")->required();
+    verb->add_option("-o,--output", options->output, "The PNG file")->required();
+    verb->add_option("--frames", options->frames, "How many")
+        ->check(CLI::Range(1, 1000))
+        ->capture_default_str();
+    verb->add_option("--columns", options->columns, "Pictures in a row")
+        ->check(CLI::Range(1, 100))
+        ->capture_default_str();
+    verb->add_option("--width", options->width, "Of a picture, in pixels")
+        ->check(CLI::Range(16, 2048))
+        ->capture_default_str();
+    options->parameters.AddTo(*verb);
+    verb->callback([&session, &status, options] {
+        Session running(session);
+        Essence essence(running, options->movie);
+        options->parameters.ApplyTo(running, options->movie, essence.map());
+        status = WriteSheet(essence, *options);
+    });
+}
+
+}  // namespace cliphost

@@ -1,0 +1,144 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/Essence.h"
+
+#include <fmt/format.h>
+
+#include "reference_host/cliphost/Describe.h"
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using host::DisplayPath;
+
+// Asks the mapping for another interface. A failed preparation leaves a pointer
+// behind that is the asker's to release.
+template <class Interface>
+NCFRESULT Ask(NMA::ISampleMapping* map, host::Ref<Interface>& out) {
+    void* found = nullptr;
+    const NCFRESULT result =
+        map->QueryInterface(ncfIdOf(static_cast<const Interface*>(nullptr)), &found);
+    out = host::Ref<Interface>::Adopt(static_cast<Interface*>(found));
+    if (result < 0) {
+        out.Reset();
+    }
+    return result;
+}
+
+}  // namespace
+
+Essence::Essence(Session& session, std::filesystem::path movie)
+    : session_(session), movie_(std::move(movie)) {
+    host::Ref<NMA::IMediaContainer3> container;
+    const NCFRESULT opened = OpenContainer(session_, movie_, container);
+    if (opened < 0) {
+        Fail("not opened", opened);
+    }
+    const Description description = DescribeContainer(session_, container.get(), movie_);
+    if (!description.file) {
+        throw Failure(kExitFile, description.problem);
+    }
+    tracks_ = ReadClipTracks(description.file.get());
+    const NCFRESULT mapped = container->GetSampleMapping(map_.Out());
+    if (mapped < 0) {
+        Fail("no sample map", mapped);
+    }
+    const NCFRESULT provided = Ask(map_.get(), provider_);
+    if (provided < 0) {
+        Fail("no sample provider", provided);
+    }
+}
+
+NMA::IUncompressedImageProvider& Essence::pictures() {
+    if (!pictures_) {
+        const NCFRESULT result = Ask(map_.get(), pictures_);
+        if (result < 0) {
+            Fail("no picture formats", result);
+        }
+    }
+    return *pictures_;
+}
+
+NMA::IUncompressedAudioProvider& Essence::sounds() {
+    if (!sounds_) {
+        const NCFRESULT result = Ask(map_.get(), sounds_);
+        if (result < 0) {
+            Fail("no sound reader", result);
+        }
+    }
+    return *sounds_;
+}
+
+const ClipTrack* Essence::First(TrackKind kind) const {
+    for (const ClipTrack& track : tracks_) {
+        if (track.kind == kind) {
+            return &track;
+        }
+    }
+    return nullptr;
+}
+
+const ClipTrack& Essence::Track(std::optional<ncfUInt32> number, TrackKind kind) const {
+    const bool wantsSound = kind == TrackKind::Sound;
+    if (!number) {
+        if (const ClipTrack* const track = First(kind)) {
+            return *track;
+        }
+        throw Failure(kExitFile, fmt::format("{}: it has no {} track; {}", DisplayPath(movie_),
+                                             NameOf(kind), TrackList()));
+    }
+    if (*number >= tracks_.size()) {
+        throw Failure(kExitCaller, fmt::format("{}: there is no track {}; {}", DisplayPath(movie_),
+                                               *number, TrackList()));
+    }
+    const ClipTrack& track = tracks_[*number];
+    if (wantsSound != (track.kind == TrackKind::Sound)) {
+        throw Failure(kExitCaller,
+                      fmt::format("{}: track {} is no {} track; {}", DisplayPath(movie_), *number,
+                                  NameOf(kind), TrackList()));
+    }
+    return track;
+}
+
+std::string Essence::TrackList() const {
+    std::string list;
+    for (const ClipTrack& track : tracks_) {
+        list += fmt::format("{}{} {}", list.empty() ? "its tracks are " : ", ", track.number,
+                            NameOf(track.kind));
+    }
+    return list.empty() ? "it has no tracks" : list;
+}
+
+// The module keeps every picture track of a movie and tells the host of the
+// first alone. Behind a second one the sounds have other numbers on its two
+// sides, and a request for sound would reach a picture.
+std::string Essence::Obstacle(const ClipTrack& track) {
+    ncfUInt32 count = 0;
+    if (track.kind != TrackKind::Sound) {
+        return {};
+    }
+    const NCFRESULT result = sounds().GetNumberOfAudioFormats(track.number, &count);
+    if (result == NCF_E_INVALIDARG) {
+        return "the movie has more than one picture track, and the module counts the further ones "
+               "before the sound, so this sound can't be delivered; take the sound out of the "
+               "movie, for instance with ffmpeg -i FILE -map 0:a -c copy SOUND.mov";
+    }
+    return result < 0 ? "no sound formats: " + ResultText(result) : std::string();
+}
+
+void Essence::NeedDelivery(const ClipTrack& track) {
+    const std::string obstacle = Obstacle(track);
+    if (!obstacle.empty()) {
+        throw Failure(kExitFile,
+                      fmt::format("{}: track {}: {}", DisplayPath(movie_), track.number, obstacle));
+    }
+}
+
+void Essence::Fail(const std::string& what, NCFRESULT result) const {
+    throw Failure(kExitFile, ProblemWith(session_, movie_, what.c_str(), result));
+}
+
+}  // namespace cliphost

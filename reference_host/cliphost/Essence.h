@@ -1,0 +1,58 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "host_interfaces/media/SampleMapping.h"
+#include "reference_host/cliphost/ClipTracks.h"
+#include "reference_host/cliphost/Session.h"
+
+namespace cliphost {
+
+// A movie opened for its samples: described first, as every host does, then
+// mapped. Owns the mapping; the session must outlive it.
+class Essence {
+public:
+    Essence(Session& session, std::filesystem::path movie);  // throws a Failure
+
+    Session& session() const { return session_; }
+    const std::filesystem::path& movie() const { return movie_; }
+    const std::vector<ClipTrack>& tracks() const { return tracks_; }
+
+    NMA::ISampleMapping& map() const { return *map_; }
+    NMA::ISampleProvider& provider() const { return *provider_; }
+    // Made when first asked for: these open the codec and the readers. Throw a
+    // Failure.
+    NMA::IUncompressedImageProvider& pictures();
+    NMA::IUncompressedAudioProvider& sounds();
+
+    // The track of a number, or the first of a kind for none. Throws a Failure
+    // for the caller when there is none, or none of that kind.
+    const ClipTrack& Track(std::optional<ncfUInt32> number, TrackKind kind) const;
+    const ClipTrack* First(TrackKind kind) const;
+
+    // Why nothing of a track can be delivered, empty when it can.
+    std::string Obstacle(const ClipTrack& track);
+    // Throws a Failure with the obstacle.
+    void NeedDelivery(const ClipTrack& track);
+
+    // A failure of the module over this movie.
+    [[noreturn]] void Fail(const std::string& what, NCFRESULT result) const;
+
+private:
+    std::string TrackList() const;
+
+    Session& session_;
+    std::filesystem::path movie_;
+    std::vector<ClipTrack> tracks_;
+    host::Ref<NMA::ISampleMapping> map_;
+    host::Ref<NMA::ISampleProvider> provider_;
+    host::Ref<NMA::IUncompressedImageProvider> pictures_;
+    host::Ref<NMA::IUncompressedAudioProvider> sounds_;
+};
+
+}  // namespace cliphost

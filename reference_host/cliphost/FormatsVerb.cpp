@@ -1,0 +1,169 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <fmt/format.h>
+
+#include <nlohmann/json.hpp>
+
+#include "reference_host/cliphost/Essence.h"
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/ImageFormats.h"
+#include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+constexpr ncfUInt32 kLittleEndian = 0x4132434C;  // 'A2CL'
+
+// The size of a buffer is told for the format at work alone, so each is set.
+Json PictureFormat(Essence& essence, const ClipTrack& track, const ImageFormat& format) {
+    NMA::IUncompressedImageProvider& pictures = essence.pictures();
+    ncfUInt16 alignment = 0;
+    ncfUInt64 size = 0;
+    NCFRESULT result = pictures.SetWorkingImageFormat(track.number, format.index);
+    if (result >= 0) {
+        result = pictures.GetWorkingImageBufferRequirements(track.number, &alignment, &size);
+    }
+    if (result < 0) {
+        essence.Fail(fmt::format("track {}: format {} can't be set", track.number, format.index),
+                     result);
+    }
+    return {{"index", format.index},
+            {"name", NameOf(format)},
+            {"words", WordsFor(format)},
+            {"bufferBytes", size},
+            {"pixelFormat", format.pixels},
+            {"chromaSubsampling", format.chroma},
+            {"componentType", format.component},
+            {"componentRange", format.range},
+            {"colorSpace", format.colorSpace},
+            {"fieldOrder", format.fieldOrder},
+            {"frameLayout", format.frameLayout},
+            {"orientation", format.orientation}};
+}
+
+void AddPicture(Essence& essence, const ClipTrack& track, Json& json) {
+    std::vector<ImageFormat> formats;
+    const NCFRESULT result = ReadImageFormats(essence.pictures(), track.number, formats);
+    if (result < 0) {
+        essence.Fail(fmt::format("track {}: no picture formats", track.number), result);
+    }
+    ncfUInt32 width = 0, height = 0;
+    if (essence.pictures().GetWorkingImageSize(track.number, &width, &height) >= 0) {
+        json["width"] = width;
+        json["height"] = height;
+        const bool isInterlaced = !formats.empty() && formats[0].fieldOrder != format::kProgressive;
+        json["heightIsOf"] = isInterlaced ? "field" : "frame";
+    }
+    json["formats"] = Json::array();
+    for (const ImageFormat& one : formats) {
+        json["formats"].push_back(PictureFormat(essence, track, one));
+    }
+}
+
+void AddSound(Essence& essence, const ClipTrack& track, Json& json) {
+    json["channels"] = track.channels;
+    NMA::IUncompressedAudioProvider& sounds = essence.sounds();
+    ncfUInt32 count = 0;
+    NCFRESULT result = sounds.GetNumberOfAudioFormats(track.number, &count);
+    json["formats"] = Json::array();
+    for (ncfUInt32 i = 0; i < count && result >= 0; ++i) {
+        ncfUInt32 order = 0;
+        ncfUInt16 bytes = 0, bits = 0;
+        result = sounds.GetAudioFormat(track.number, i, &order, &bytes, &bits);
+        const bool isLittle = order == kLittleEndian;
+        const auto aSecond =
+            static_cast<std::uint64_t>(track.RateAsNumber()) * bytes * track.channels;
+        json["formats"].push_back({{"index", i},
+                                   {"name", isLittle ? "A2CL" : "A2CB"},
+                                   {"words", fmt::format("{}-bit PCM in {} bytes, {}-endian, "
+                                                         "interleaved",
+                                                         bits, bytes, isLittle ? "little" : "big")},
+                                   {"bufferBytes", aSecond}});
+    }
+    if (result < 0) {
+        essence.Fail(fmt::format("track {}: no sound formats", track.number), result);
+    }
+}
+
+Json FormatsOf(Essence& essence) {
+    Json list = Json::array();
+    for (const ClipTrack& track : essence.tracks()) {
+        Json json = {{"track", track.number},
+                     {"kind", NameOf(track.kind)},
+                     {"length", track.length},
+                     {"rate", fmt::format("{}/{}", track.rate.numerator, track.rate.denominator)}};
+        const std::string obstacle = essence.Obstacle(track);
+        if (!obstacle.empty()) {
+            json["obstacle"] = obstacle;
+        } else if (track.kind == TrackKind::Sound) {
+            AddSound(essence, track, json);
+        } else {
+            AddPicture(essence, track, json);
+        }
+        list.push_back(std::move(json));
+    }
+    return list;
+}
+
+void PrintTrack(const Json& track) {
+    const bool isSound = track["kind"] == "sound";
+    fmt::print("track {}: {}, {} {} at {} a second", track["track"].get<int>(),
+               track["kind"].get<std::string>(), track["length"].get<std::uint64_t>(),
+               isSound ? "samples" : "frames", track["rate"].get<std::string>());
+    if (track.contains("width")) {
+        fmt::print(", {} {} x {}", track["heightIsOf"].get<std::string>(),
+                   track["width"].get<int>(), track["height"].get<int>());
+    }
+    if (track.contains("channels")) {
+        fmt::print(", {} channels", track["channels"].get<int>());
+    }
+    fmt::print("\n");
+    if (track.contains("obstacle")) {
+        fmt::print("  {}\n", track["obstacle"].get<std::string>());
+        return;
+    }
+    for (const Json& one : track["formats"]) {
+        fmt::print("  {} {:<10} {}\n               {} bytes a {}\n", one["index"].get<int>(),
+                   one["name"].get<std::string>(), one["words"].get<std::string>(),
+                   one["bufferBytes"].get<std::uint64_t>(), isSound ? "second" : "frame");
+    }
+    if (track["formats"].empty()) {
+        fmt::print("  no format is offered\n");
+    }
+}
+
+}  // namespace
+
+void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
+    auto* const verb = app.add_subcommand(
+        "formats", "List the formats in which the module offers each track of a movie");
+    verb->footer("Example: cliphost formats clip.mov --use-alpha");
+    auto movie = std::make_shared<std::filesystem::path>();
+    auto json = std::make_shared<bool>(false);
+    auto parameters = std::make_shared<ParameterOptions>();
+    verb->add_option("movie", *movie, "The movie")->required();
+    verb->add_flag("--json", *json, "As JSON");
+    parameters->AddTo(*verb);
+    verb->callback([&session, movie, json, parameters] {
+        Session running(session);
+        Essence essence(running, *movie);
+        parameters->ApplyTo(running, *movie, essence.map());
+        const Json list = FormatsOf(essence);
+        if (*json) {
+            fmt::print("{}\n", Json{{"movie", host::DisplayPath(*movie)}, {"tracks", list}}.dump(
+                                   2, ' ', false, Json::error_handler_t::replace));
+            return;
+        }
+        fmt::print("{}\n", host::DisplayPath(*movie));
+        for (const Json& track : list) {
+            PrintTrack(track);
+        }
+    });
+}
+
+}  // namespace cliphost

@@ -1,0 +1,113 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/FrameReader.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/PixelsToPicture.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+
+FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::string& formatName)
+    : essence_(essence), track_(track), request_(host::MakeRef<host::SampleRequest>()) {
+    Choose(formatName);
+    NMA::IUncompressedImageProvider& pictures = essence_.pictures();
+    NCFRESULT result = pictures.SetWorkingImageFormat(track_.number, format_.index);
+    if (result < 0) {
+        essence_.Fail("the format can't be set", result);
+    }
+    ncfUInt32 width = 0, fieldHeight = 0;
+    ncfUInt16 alignment = 0;
+    ncfUInt64 size = 0;
+    result = pictures.GetWorkingImageSize(track_.number, &width, &fieldHeight);
+    if (result >= 0) {
+        result = pictures.GetWorkingImageBufferRequirements(track_.number, &alignment, &size);
+    }
+    if (result < 0) {
+        essence_.Fail("no picture size", result);
+    }
+    // The size told is that of a field where there are two; the buffer always
+    // holds a frame.
+    const ncfUInt64 lineBytes = ncfUInt64{width} * static_cast<ncfUInt64>(layout().bytesPerPixel);
+    width_ = static_cast<int>(width);
+    height_ = lineBytes == 0 ? 0 : static_cast<int>(size / lineBytes);
+    frameBytes_ = size;
+    result = essence_.provider().Setup(track_.number);
+    if (result < 0) {
+        essence_.Fail("the reader does not start", result);
+    }
+}
+
+FrameReader::~FrameReader() {
+    essence_.provider().Cleanup(track_.number);
+}
+
+void FrameReader::Choose(const std::string& formatName) {
+    std::vector<ImageFormat> formats;
+    const NCFRESULT result = ReadImageFormats(essence_.pictures(), track_.number, formats);
+    if (result < 0) {
+        essence_.Fail("no picture formats", result);
+    }
+    if (const ImageFormat* const chosen = ChooseFormat(formats, formatName)) {
+        format_ = *chosen;
+        return;
+    }
+    std::string offered;
+    for (const ImageFormat& one : formats) {
+        offered += (offered.empty() ? "" : ", ") + NameOf(one);
+    }
+    const std::string file = host::DisplayPath(essence_.movie());
+    if (offered.empty()) {
+        throw Failure(kExitFile, fmt::format("{}: track {}: the module offers no format of it; "
+                                             "its codec may be unknown",
+                                             file, track_.number));
+    }
+    throw Failure(kExitCaller, fmt::format("{}: track {}: there is no format '{}'; it offers {}",
+                                           file, track_.number, formatName, offered));
+}
+
+std::uint64_t FrameReader::MostFrames() const {
+    ncfUInt64 samples = 0;
+    if (essence_.map().GetNumberOfSamples(track_.number, &samples) < 0) {
+        samples = track_.length;
+    }
+    return std::min<std::uint64_t>(track_.length, samples);
+}
+
+std::uint64_t FrameReader::Count() {
+    if (count_) {
+        return *count_;
+    }
+    std::uint64_t count = MostFrames();
+    // Edits can leave fewer pictures than the length says. Where they end is
+    // found by asking for one in the middle of what is open.
+    if (count > 1 && Read(count - 1) == NMA_E_NODATA) {
+        std::uint64_t there = 0;
+        while (there + 1 < count) {
+            const std::uint64_t middle = there + (count - there) / 2;
+            (Read(middle) == NMA_E_NODATA ? count : there) = middle;
+        }
+    }
+    count_ = count;
+    return count;
+}
+
+NCFRESULT FrameReader::Read(std::uint64_t frame) {
+    request_->Ask(track_.number, frame, 1);
+    const NCFRESULT result = essence_.provider().ProvideSampleRange(request_.get(), 0);
+    // A picture that may not be read comes back without a failure by sign.
+    const bool isWhole =
+        request_->buffer().isComplete() && request_->buffer().validBytes() == frameBytes_;
+    return result == NCF_OK && !isWhole ? NCF_E_FAIL : result;
+}
+
+Picture FrameReader::ToPicture() const {
+    return PixelsToPicture(format_, width_, height_, bytes(),
+                           static_cast<std::size_t>(request_->buffer().validBytes()));
+}
+
+}  // namespace cliphost

@@ -1,0 +1,157 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/FrameSink.h"
+
+#include <fmt/format.h>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/PixelsToPicture.h"
+#include "reference_host/cliphost/PngFile.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using host::DisplayPath;
+
+void WritePng(const std::filesystem::path& file, const FrameReader& reader,
+              const FrameReader* alpha) {
+    Picture picture = reader.ToPicture();
+    if (alpha) {
+        picture = WithAlpha(picture, alpha->ToPicture());
+    }
+    const std::vector<unsigned char> png = ToPng(picture);
+    if (png.empty()) {
+        throw Failure(kExitFile, fmt::format("{}: a picture of {} x {} in the format {} can't be "
+                                             "made a PNG file; take a .raw file",
+                                             DisplayPath(file), reader.width(), reader.height(),
+                                             reader.layout().name));
+    }
+    OutputFile output(file);
+    output.Write(png.data(), png.size());
+    output.Finish();
+}
+
+class RawSink final : public FrameSink {
+public:
+    explicit RawSink(const std::filesystem::path& file) : file_(file), output_(file) {}
+
+    void Take(std::uint64_t, const FrameReader& reader, const FrameReader*) override {
+        output_.Write(reader.bytes(), static_cast<std::size_t>(reader.frameBytes()));
+        ++frames_;
+    }
+    void Finish() override { output_.Finish(); }
+    std::string Summary() const override {
+        return OutputFile::IsStandardOutput(file_)
+                   ? std::string()
+                   : fmt::format("{}: {} raw frames", DisplayPath(file_), frames_);
+    }
+    bool IsRaw() const override { return true; }
+
+private:
+    std::filesystem::path file_;
+    OutputFile output_;
+    std::uint64_t frames_ = 0;
+};
+
+class PngSink final : public FrameSink {
+public:
+    explicit PngSink(std::filesystem::path file) : file_(std::move(file)) {}
+
+    void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {
+        WritePng(file_, reader, alpha);
+        words_ = fmt::format("{}: frame {}, {} x {}", DisplayPath(file_), frame, reader.width(),
+                             reader.height());
+    }
+    void Finish() override {}
+    std::string Summary() const override { return words_; }
+    bool IsRaw() const override { return false; }
+
+private:
+    std::filesystem::path file_;
+    std::string words_;
+};
+
+class FolderSink final : public FrameSink {
+public:
+    FolderSink(std::filesystem::path folder, std::filesystem::path stem)
+        : folder_(std::move(folder)), stem_(std::move(stem)) {
+        std::error_code error;
+        std::filesystem::create_directories(folder_, error);
+        if (error) {
+            throw Failure(kExitCaller, fmt::format("{}: the folder can't be made: {}",
+                                                   DisplayPath(folder_), error.message()));
+        }
+    }
+
+    void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {
+        std::filesystem::path name = stem_;
+        name += fmt::format("_{:06}.png", frame);
+        WritePng(folder_ / name, reader, alpha);
+        ++frames_;
+    }
+    void Finish() override {}
+    std::string Summary() const override {
+        return fmt::format("{}: {} pictures", DisplayPath(folder_), frames_);
+    }
+    bool IsRaw() const override { return false; }
+
+private:
+    std::filesystem::path folder_;
+    std::filesystem::path stem_;
+    std::uint64_t frames_ = 0;
+};
+
+}  // namespace
+
+std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
+                                         const std::filesystem::path& movie, bool isOneFrame) {
+    const std::string ending = output.extension().string();
+    std::error_code ignored;
+    if (!OutputFile::IsStandardOutput(output) &&
+        std::filesystem::equivalent(output, movie, ignored)) {
+        throw Failure(kExitCaller,
+                      fmt::format("{}: this is the movie itself", DisplayPath(output)));
+    }
+    if (std::filesystem::is_directory(output, ignored)) {
+        return std::make_unique<FolderSink>(output, movie.stem());
+    }
+    if (OutputFile::IsStandardOutput(output) || ending == ".raw") {
+        return std::make_unique<RawSink>(output);
+    }
+    if (ending == ".png") {
+        if (isOneFrame) {
+            return std::make_unique<PngSink>(output);
+        }
+        throw Failure(kExitCaller, fmt::format("{}: a PNG file holds one frame; give a folder or a "
+                                               ".raw file for a range",
+                                               DisplayPath(output)));
+    }
+    if (!ending.empty()) {
+        throw Failure(kExitCaller,
+                      fmt::format("{}: '{}' is no ending that is written; give FILE.png, FILE.raw, "
+                                  "a folder, or - for standard output",
+                                  DisplayPath(output), ending));
+    }
+    return std::make_unique<FolderSink>(output, movie.stem());
+}
+
+std::string RawWords(const FrameReader& reader, const ClipTrack& track) {
+    std::string words =
+        fmt::format("raw frames: {} x {}, {}, {} bytes a frame, {}/{} frames a second",
+                    reader.width(), reader.height(), WordsFor(reader.format()), reader.frameBytes(),
+                    track.rate.numerator, track.rate.denominator);
+    if (const char* const name = reader.layout().rawName) {
+        words += fmt::format(
+            "\nfor FFmpeg: -f rawvideo -pixel_format {} -video_size {}x{} "
+            "-framerate {}/{}",
+            name, reader.width(), reader.height(), track.rate.numerator, track.rate.denominator);
+    } else {
+        words +=
+            "\nFFmpeg has no name for this layout; take --format with another where one is "
+            "offered";
+    }
+    return words;
+}
+
+}  // namespace cliphost

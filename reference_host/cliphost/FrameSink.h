@@ -1,0 +1,36 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <optional>
+
+#include "reference_host/cliphost/FrameReader.h"
+#include "reference_host/cliphost/OutputFile.h"
+
+namespace cliphost {
+
+// Where frames go: each is taken right after it was read.
+class FrameSink {
+public:
+    virtual ~FrameSink() = default;
+    // `alpha` holds the same frame of the alpha track, or is null.
+    virtual void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) = 0;
+    virtual void Finish() = 0;
+    // A line for the user once all is there.
+    virtual std::string Summary() const = 0;
+    virtual bool IsRaw() const = 0;
+};
+
+// The sink that a path asks for: "-" and FILE.raw take the bytes as they are
+// delivered, one frame behind the other; FILE.png takes one frame; a folder
+// takes a PNG for each, named after the movie and the frame, and is made when
+// it is not there. Throws a Failure for the caller.
+std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
+                                         const std::filesystem::path& movie, bool isOneFrame);
+
+// What a program that reads raw frames has to be told: size, layout, rate.
+std::string RawWords(const FrameReader& reader, const ClipTrack& track);
+
+}  // namespace cliphost

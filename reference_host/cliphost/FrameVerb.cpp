@@ -1,0 +1,164 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <fmt/format.h>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/FrameRange.h"
+#include "reference_host/cliphost/FrameSink.h"
+#include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using host::DisplayPath;
+
+struct FrameOptions {
+    std::filesystem::path movie;
+    std::optional<ncfUInt32> track;
+    std::uint64_t frame = 0;
+    std::string range;
+    std::string format;
+    std::filesystem::path output;
+    bool withAlpha = false;
+    ParameterOptions parameters;
+};
+
+// Writes the frames that the command line names; one that does not decode is
+// told and left out.
+class FrameRun {
+public:
+    FrameRun(Essence& essence, const FrameOptions& options)
+        : essence_(essence),
+          options_(options),
+          track_(essence.Track(options.track, TrackKind::Picture)),
+          reader_(essence, track_, options.format) {}
+
+    int Run();
+
+private:
+    FrameRange WantedFrames();
+    void Write(std::uint64_t frame, FrameSink& sink);
+
+    Essence& essence_;
+    const FrameOptions& options_;
+    const ClipTrack& track_;
+    FrameReader reader_;
+    std::unique_ptr<FrameReader> alpha_;
+    int failed_ = 0;
+    int written_ = 0;
+};
+
+FrameRange FrameRun::WantedFrames() {
+    FrameRange range = ParseFrameRange(
+        options_.range.empty() ? fmt::format("{}:{}", options_.frame, options_.frame + 1)
+                               : options_.range);
+    // One frame need not be counted: it is there or it is not.
+    const bool isCertain = options_.range.empty() && range.first < reader_.MostFrames();
+    const std::uint64_t count = isCertain ? range.first + 1 : reader_.Count();
+    if (range.CountIn(count) == 0) {
+        throw Failure(
+            kExitCaller,
+            fmt::format("{}: track {}: there is no frame {}; it has {}, from 0 on",
+                        DisplayPath(essence_.movie()), track_.number, range.first, count));
+    }
+    range.end = std::min(range.end.value_or(count), count);
+    return range;
+}
+
+int FrameRun::Run() {
+    if (options_.withAlpha) {
+        const ClipTrack& track = essence_.Track(std::nullopt, TrackKind::Alpha);
+        alpha_ = std::make_unique<FrameReader>(essence_, track, "deepest");
+    }
+    const FrameRange range = WantedFrames();
+    const auto sink =
+        MakeFrameSink(options_.output, options_.movie, range.CountIn(*range.end) == 1);
+    if (sink->IsRaw() && options_.withAlpha) {
+        throw Failure(kExitCaller,
+                      "--with-alpha is for PNG files; raw frames of the alpha are "
+                      "those of its own track, see `cliphost formats --use-alpha`");
+    }
+    if (sink->IsRaw()) {
+        fmt::print(stderr, "{}\n", RawWords(reader_, track_));
+    }
+    Progress progress("frames", range.CountIn(*range.end));
+    try {
+        for (std::uint64_t frame = range.first; frame < *range.end; frame += range.step) {
+            progress.Step(fmt::format("{}", frame));
+            Write(frame, *sink);
+        }
+        if (written_ > 0) {
+            sink->Finish();
+        }
+    } catch (const ReaderGone&) {
+        return kExitFine;  // it has seen enough
+    }
+    if (written_ > 0 && !sink->Summary().empty()) {
+        fmt::print("{}\n", sink->Summary());
+    }
+    return failed_ == 0 ? kExitFine : kExitFile;
+}
+
+void FrameRun::Write(std::uint64_t frame, FrameSink& sink) {
+    NCFRESULT result = reader_.Read(frame);
+    if (result == NCF_OK && alpha_) {
+        result = alpha_->Read(frame);
+    }
+    if (result != NCF_OK) {
+        ++failed_;
+        essence_.session().TakeNotices();
+        fmt::print(stderr,
+                   "cliphost: {}: track {}: frame {} is left out, it could not be read: {}\n",
+                   DisplayPath(essence_.movie()), track_.number, frame, ResultText(result));
+        return;
+    }
+    sink.Take(frame, reader_, alpha_.get());
+    ++written_;
+}
+
+}  // namespace
+
+void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
+    auto* const verb =
+        app.add_subcommand("frame", "Write frames as PNG pictures, or raw for other programs");
+    verb->footer(
+        "Example: cliphost frame clip.mov --frame 100 --format deepest -o still.png\n"
+        "Example: cliphost frame clip.mov --range 0: -o - |\n"
+        "           ffplay -f rawvideo -pixel_format uyvy422 -video_size 1920x1080 -framerate 25 "
+        "-i -\n"
+        "Standard error tells the pixel format, size and rate of raw frames.");
+    auto options = std::make_shared<FrameOptions>();
+    verb->add_option("movie", options->movie, "The movie")->required();
+    verb->add_option("--track", options->track, "Its number; the first picture when not given");
+    auto* const frame =
+        verb->add_option("--frame", options->frame, "Its number, from 0")->capture_default_str();
+    verb->add_option("--range", options->range,
+                     "FIRST:END or FIRST:END:STEP; END is not among them, and may be left out")
+        ->excludes(frame);
+    verb->add_option("--format", options->format,
+                     "A name or number that `cliphost formats` lists, or 'deepest'; the first that "
+                     "a picture can be made of when not given");
+    verb->add_flag("--with-alpha", options->withAlpha,
+                   "Give the PNG pictures the alpha of the clip");
+    verb->add_option("-o,--output", options->output,
+                     "FILE.png, FILE.raw, a folder for a PNG each, or - for raw frames on standard "
+                     "output")
+        ->required();
+    options->parameters.AddTo(*verb);
+    verb->callback([&session, &status, options] {
+        SessionOptions own = session;
+        if (options->withAlpha) {
+            own.host.ignoreAlpha = false;
+        }
+        Session running(own);
+        Essence essence(running, options->movie);
+        options->parameters.ApplyTo(running, options->movie, essence.map());
+        status = FrameRun(essence, *options).Run();
+    });
+}
+
+}  // namespace cliphost

@@ -1,0 +1,43 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstddef>
+#include <filesystem>
+#include <stdexcept>
+
+namespace cliphost {
+
+// The program that read our standard output ended; no failure of ours.
+class ReaderGone : public std::runtime_error {
+public:
+    ReaderGone() : std::runtime_error("the reader of the output has gone") {}
+};
+
+// A file that is there whole or not at all: it is written beside its place under
+// another name, and takes its place when it is finished. An object that ends
+// unfinished leaves nothing. A path of "-" is standard output, and devices and
+// pipes are written as they are.
+class OutputFile {
+public:
+    explicit OutputFile(std::filesystem::path path);  // throws a Failure
+    ~OutputFile();
+    OutputFile(const OutputFile&) = delete;
+    OutputFile& operator=(const OutputFile&) = delete;
+
+    // Throws a Failure that tells why, or ReaderGone.
+    void Write(const void* bytes, std::size_t size);
+    void Finish();  // throws a Failure
+
+    static bool IsStandardOutput(const std::filesystem::path& path) { return path == "-"; }
+
+private:
+    [[noreturn]] void Fail(int error);
+    void Close();
+
+    std::filesystem::path path_;
+    std::filesystem::path written_;  // empty: the place itself is written
+    int descriptor_ = -1;
+};
+
+}  // namespace cliphost

@@ -1,0 +1,202 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <fmt/format.h>
+
+#include <nlohmann/json.hpp>
+
+#include "reference_host/cliphost/Essence.h"
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/SampleMap.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+struct SamplesOptions {
+    std::filesystem::path movie;
+    std::optional<ncfUInt32> track;
+    bool every = false;
+    bool json = false;
+};
+
+// Shows the maps of tracks: each sample of a picture, the runs of a sound, whose
+// samples are many and alike.
+class SamplesRun {
+public:
+    SamplesRun(Essence& essence, const SamplesOptions& options)
+        : essence_(essence), options_(options) {
+        std::error_code ignored;
+        fileSize_ = std::filesystem::file_size(options.movie, ignored);
+    }
+
+    int Run();
+
+private:
+    void ShowTrack(const ClipTrack& track);
+    void ShowSamples(const ClipTrack& track, std::uint64_t count, Json& json);
+    void ShowRuns(const RunMap& runs, Json& json);
+    void ShowSums(const RunMap& runs, Json& json);
+
+    Essence& essence_;
+    const SamplesOptions& options_;
+    std::uint64_t fileSize_ = 0;
+    Json tracks_ = Json::array();
+    bool isSound_ = true;  // nothing wrong was found
+};
+
+std::string OffsetText(const MappedSample& sample) {
+    return sample.temporalOffset ? fmt::format("{:+}", *sample.temporalOffset) : "unknown";
+}
+
+Json ToJson(const MappedSample& sample) {
+    Json json = {{"sample", sample.number}, {"position", sample.position}, {"size", sample.size}};
+    if (sample.temporalOffset) {
+        json["temporalOffset"] = *sample.temporalOffset;
+    } else {
+        json["temporalOffset"] = nullptr;
+    }
+    json["properties"] = sample.properties;
+    json["dependencies"] = sample.dependencies;
+    json["contiguousSamples"] = sample.contiguousSamples;
+    json["contiguousBytes"] = sample.contiguousBytes;
+    return json;
+}
+
+void SamplesRun::ShowSamples(const ClipTrack& track, std::uint64_t count, Json& json) {
+    constexpr std::uint64_t kStep = 1024;  // samples between two looks at the bar
+    Progress progress("samples", static_cast<std::size_t>(count / kStep + 1));
+    if (!options_.json) {
+        fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", "sample", "position", "size",
+                   "offset", "properties", "bytes that follow each other");
+    }
+    for (std::uint64_t i = 0; i < count; ++i) {
+        if (i % kStep == 0) {
+            progress.Step(fmt::format("{}", i));
+        }
+        MappedSample sample;
+        const NCFRESULT result = ReadMappedSample(essence_.map(), track.number, i, sample);
+        if (result < 0) {
+            essence_.Fail(fmt::format("track {}: sample {} can't be mapped", track.number, i),
+                          result);
+        }
+        if (options_.json) {
+            json["map"].push_back(ToJson(sample));
+        } else {
+            fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", i, sample.position, sample.size,
+                       OffsetText(sample), WordsForProperties(sample.properties),
+                       sample.contiguousBytes);
+        }
+    }
+}
+
+void SamplesRun::ShowRuns(const RunMap& runs, Json& json) {
+    if (!options_.json) {
+        fmt::print("  {:>10} {:>10} {:>14} {:>12}\n", "from", "samples", "position", "bytes");
+    }
+    for (const SampleRun& run : runs.runs) {
+        if (options_.json) {
+            json["runs"].push_back({{"first", run.first},
+                                    {"count", run.count},
+                                    {"position", run.position},
+                                    {"bytes", run.bytes}});
+        } else {
+            fmt::print("  {:>10} {:>10} {:>14} {:>12}\n", run.first, run.count, run.position,
+                       run.bytes);
+        }
+    }
+}
+
+void SamplesRun::ShowSums(const RunMap& runs, Json& json) {
+    isSound_ = isSound_ && runs.faults.empty();
+    if (options_.json) {
+        json["bytes"] = runs.bytes;
+        json["faults"] = runs.faults;
+        return;
+    }
+    fmt::print("  {} bytes in {} runs; the file has {}\n", runs.bytes, runs.runs.size(), fileSize_);
+    for (const std::string& fault : runs.faults) {
+        fmt::print("  wrong: {}\n", fault);
+    }
+    if (runs.faults.empty()) {
+        fmt::print("  all of it lies inside the file, and the sums agree\n");
+    }
+}
+
+void SamplesRun::ShowTrack(const ClipTrack& track) {
+    const RunMap runs = ReadRuns(essence_.map(), track.number, fileSize_);
+    if (runs.result < 0) {
+        essence_.Fail(fmt::format("track {}: its samples can't be mapped", track.number),
+                      runs.result);
+    }
+    ncfUInt32 channels = 0;
+    Json json = {{"track", track.number}, {"kind", NameOf(track.kind)}, {"samples", runs.samples}};
+    const bool hasChannels = track.kind == TrackKind::Sound && essence_.Obstacle(track).empty() &&
+                             essence_.map().GetNumberOfChannels(track.number, &channels) >= 0;
+    if (hasChannels) {
+        json["channels"] = channels;
+    }
+    if (!options_.json) {
+        fmt::print("track {}: {}, {} samples{}\n", track.number, NameOf(track.kind), runs.samples,
+                   hasChannels ? fmt::format(" of {} channels", channels) : "");
+    }
+    if (track.kind == TrackKind::Sound && !options_.every) {
+        ShowRuns(runs, json);
+    } else {
+        ShowSamples(track, runs.samples, json);
+    }
+    ShowSums(runs, json);
+    tracks_.push_back(std::move(json));
+}
+
+int SamplesRun::Run() {
+    if (!options_.json) {
+        fmt::print("{}\n", host::DisplayPath(options_.movie));
+    }
+    for (const ClipTrack& track : essence_.tracks()) {
+        if (!options_.track || *options_.track == track.number) {
+            ShowTrack(track);
+        }
+    }
+    if (tracks_.empty()) {
+        throw Failure(
+            kExitCaller,
+            fmt::format("{}: there is no track {}; it has {}", host::DisplayPath(options_.movie),
+                        options_.track.value_or(0), essence_.tracks().size()));
+    }
+    if (options_.json) {
+        fmt::print("{}\n", Json{{"movie", host::DisplayPath(options_.movie)},
+                                {"fileBytes", fileSize_},
+                                {"tracks", tracks_}}
+                               .dump(2, ' ', false, Json::error_handler_t::replace));
+    }
+    return isSound_ ? kExitFine : kExitFile;
+}
+
+}  // namespace
+
+void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
+    auto* const verb =
+        app.add_subcommand("samples", "Show where the samples of a movie lie in its file");
+    verb->footer(
+        "Example: cliphost samples clip.mov --track 0 --json\n"
+        "Samples stand in the order of decoding; the offset says how many further on lies the one "
+        "that is\ndisplayed at this place. Sums that do not agree with the file give exit status "
+        "1.");
+    auto options = std::make_shared<SamplesOptions>();
+    verb->add_option("movie", options->movie, "The movie")->required();
+    verb->add_option("--track", options->track, "Only this one");
+    verb->add_flag("--every", options->every, "Each sample of sound too, not its runs");
+    verb->add_flag("--json", options->json, "As JSON");
+    verb->callback([&session, &status, options] {
+        Session running(session);
+        Essence essence(running, options->movie);
+        status = SamplesRun(essence, *options).Run();
+    });
+}
+
+}  // namespace cliphost
