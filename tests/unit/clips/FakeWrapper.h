@@ -203,9 +203,7 @@ public:
     }
     ncfBool GetFieldLayoutForTrack(ncfUInt32 track, ncfUInt32* count) override {
         lastTrack = track;
-        if (fieldCount != 0) {
-            *count = fieldCount;
-        }
+        *count = fieldCount != 0 ? fieldCount : 2;  // not to be believed without a true
         return note("GetFieldLayoutForTrack", fieldCount != 0);
     }
     NCFRESULT GetFourCCFromImageDescrptor(ncfUInt32 track, ncfUInt8* fourBytes) override {
