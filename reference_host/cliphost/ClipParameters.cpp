@@ -9,6 +9,8 @@
 #include <charconv>
 
 #include "host_interfaces/media/PluginComponents.h"
+#include "host_interfaces/media/SampleMapping.h"
+#include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/framework/HostPath.h"
@@ -112,12 +114,16 @@ bool HoldsValues(const host::ParameterDocument& document) {
 
 }  // namespace
 
-ClipParameters::ClipParameters(Session& session, std::filesystem::path movie, INCFUnknown& mapping)
+ClipParameters::ClipParameters(Session& session, std::filesystem::path movie,
+                               NMA::IMediaContainer3& container)
     : session_(session), movie_(std::move(movie)) {
-    const NCFRESULT result = host::Query(&mapping, parameters_);
+    host::Ref<NMA::ISampleMapping> mapping;
+    NCFRESULT result = container.GetSampleMapping(mapping.Out());
+    if (result >= 0) {
+        result = host::Query(mapping.get(), parameters_);
+    }
     if (result < 0) {
-        throw Failure(kExitFile, fmt::format("{}: no parameters: {}", DisplayPath(movie_),
-                                             ResultText(result)));
+        throw Failure(kExitFile, ProblemWith(session_, movie_, "no parameters", result));
     }
 }
 

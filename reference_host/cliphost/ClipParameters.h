@@ -8,6 +8,7 @@
 #include <utility>
 #include <vector>
 
+#include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/parameters/ParametersXML.h"
 #include "reference_host/cliphost/Session.h"
 #include "reference_host/parameters/ParameterDocument.h"
@@ -24,13 +25,14 @@ struct ClipParameter {
     std::optional<ncfUInt32> defaultValue;
 };
 
-// The parameters of one open movie, which the session must outlive. A change is
-// in force at once for what is asked of the same sample mapping afterwards.
-// Everything here throws a Failure.
+// The parameters of one open movie, which the session must outlive. They belong
+// to the clip that all mappings of its container share. Formats that a mapping
+// has made stay as they were, so ask a new mapping for those that come of a
+// change. Everything here throws a Failure.
 class ClipParameters {
 public:
-    // Asks a sample mapping, which is borrowed for the call.
-    ClipParameters(Session& session, std::filesystem::path movie, INCFUnknown& mapping);
+    // Over a sample mapping of its own.
+    ClipParameters(Session& session, std::filesystem::path movie, NMA::IMediaContainer3& container);
 
     std::string Xml(ParameterXml which);
     std::vector<ClipParameter> List();

@@ -30,7 +30,7 @@ NCFRESULT Ask(NMA::ISampleMapping* map, host::Ref<Interface>& out) {
 
 }  // namespace
 
-Essence::Essence(Session& session, std::filesystem::path movie)
+Essence::Essence(Session& session, std::filesystem::path movie, const ParameterOptions& parameters)
     : session_(session), movie_(std::move(movie)) {
     host::Ref<NMA::IMediaContainer3> container;
     const NCFRESULT opened = OpenContainer(session_, movie_, container);
@@ -42,6 +42,8 @@ Essence::Essence(Session& session, std::filesystem::path movie)
         throw Failure(kExitFile, description.problem);
     }
     tracks_ = ReadClipTracks(description.file.get());
+    // Before there is a mapping: it then makes no format of the former fields.
+    parameters.ApplyTo(session_, movie_, *container);
     const NCFRESULT mapped = container->GetSampleMapping(map_.Out());
     if (mapped < 0) {
         Fail("no sample map", mapped);

@@ -9,15 +9,18 @@
 
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
+#include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Session.h"
 
 namespace cliphost {
 
 // A movie opened for its samples: described first, as every host does, then
-// mapped. Owns the mapping; the session must outlive it.
+// given its parameters, then mapped. Owns the mapping; the session must outlive
+// it.
 class Essence {
 public:
-    Essence(Session& session, std::filesystem::path movie);  // throws a Failure
+    // Throws a Failure.
+    Essence(Session& session, std::filesystem::path movie, const ParameterOptions& parameters = {});
 
     Session& session() const { return session_; }
     const std::filesystem::path& movie() const { return movie_; }

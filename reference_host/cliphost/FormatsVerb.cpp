@@ -151,8 +151,7 @@ void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
     parameters->AddTo(*verb);
     verb->callback([&session, movie, json, parameters] {
         Session running(session);
-        Essence essence(running, *movie);
-        parameters->ApplyTo(running, *movie, essence.map());
+        Essence essence(running, *movie, *parameters);
         const Json list = FormatsOf(essence);
         if (*json) {
             fmt::print("{}\n", Json{{"movie", host::DisplayPath(*movie)}, {"tracks", list}}.dump(

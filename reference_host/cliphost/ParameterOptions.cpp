@@ -34,9 +34,9 @@ void ParameterOptions::ApplyTo(ClipParameters& parameters) const {
 }
 
 void ParameterOptions::ApplyTo(Session& session, const std::filesystem::path& movie,
-                               INCFUnknown& mapping) const {
+                               NMA::IMediaContainer3& container) const {
     if (!IsEmpty()) {
-        ClipParameters parameters(session, movie, mapping);
+        ClipParameters parameters(session, movie, container);
         ApplyTo(parameters);
     }
 }

@@ -9,8 +9,8 @@
 namespace cliphost {
 
 // The options by which any verb lets the user change a clip's parameters. The
-// verb keeps them and applies them to the mapping that it opens, before it asks
-// for formats.
+// verb keeps them and applies them to the container that it opens, before it
+// takes a mapping of it.
 class ParameterOptions {
 public:
     void AddTo(CLI::App& verb);
@@ -19,9 +19,10 @@ public:
     // A document first, then the defaults, then single values, whatever their
     // order on the command line. Throws a Failure.
     void ApplyTo(ClipParameters& parameters) const;
-    // The same for a mapping; asks for no parameters when there is nothing to
+    // The same for a container; asks for no parameters when there is nothing to
     // apply.
-    void ApplyTo(Session& session, const std::filesystem::path& movie, INCFUnknown& mapping) const;
+    void ApplyTo(Session& session, const std::filesystem::path& movie,
+                 NMA::IMediaContainer3& container) const;
 
 private:
     std::vector<std::string> assignments_;

@@ -6,12 +6,9 @@
 #include <map>
 #include <nlohmann/json.hpp>
 
-#include "host_interfaces/media/MediaContainer.h"
-#include "host_interfaces/media/PluginComponents.h"
-#include "host_interfaces/media/SampleMapping.h"
+#include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ParameterOptions.h"
-#include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -30,28 +27,6 @@ struct ParamsOptions {
 const std::map<std::string, ParameterXml> kXml = {{"values", ParameterXml::kValues},
                                                   {"description", ParameterXml::kDescription},
                                                   {"defaults", ParameterXml::kDefaults}};
-
-host::Ref<NMA::ISampleMapping> Map(Session& session, const std::filesystem::path& movie) {
-    const auto path = PathForModule(movie);
-    host::Ref<NMA::IMediaContainer3> container;
-    host::Ref<NMA::ISampleMapping> mapping;
-    NCFRESULT result = session.host().Create(NMA::CompID_QuickTimeContainer, container);
-    if (result >= 0) {
-        result = container->SetFilePath(path.get());
-    }
-    if (result >= 0) {
-        result = container->GetSampleMapping(mapping.Out());
-    }
-    if (result < 0) {
-        std::string message =
-            fmt::format("{}: not opened: {}", DisplayPath(movie), ResultText(result));
-        for (const std::string& notice : session.TakeNotices()) {
-            message += "\n  the module said: " + notice;
-        }
-        throw Failure(kExitFile, message);
-    }
-    return mapping;
-}
 
 // All choices of a parameter, a star at the one in use. A number that is none of
 // them is the file's own way.
@@ -136,8 +111,12 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
     verb->add_flag("--json", options->json, "As JSON")->excludes(xml);
     verb->callback([&session, options] {
         Session running(session);
-        const auto mapping = Map(running, options->movie);
-        ClipParameters parameters(running, options->movie, *mapping);
+        host::Ref<NMA::IMediaContainer3> container;
+        const NCFRESULT opened = OpenContainer(running, options->movie, container);
+        if (opened < 0) {
+            throw Failure(kExitFile, ProblemWith(running, options->movie, "not opened", opened));
+        }
+        ClipParameters parameters(running, options->movie, *container);
         options->parameters.ApplyTo(parameters);
         Print(parameters, *options);
     });
