@@ -1,0 +1,72 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/MovieDiagnosis.h"
+
+#include <gtest/gtest.h>
+
+#include "tests/unit/cliphost/TestFolder.h"
+
+using cliphost::DiagnoseMovie;
+using namespace cliphost_tests;
+
+namespace {
+
+std::string Atom(const std::string& type, const std::string& body, std::size_t claimed = 0) {
+    const std::size_t size = claimed != 0 ? claimed : body.size() + 8;
+    std::string atom;
+    for (int shift = 24; shift >= 0; shift -= 8) {
+        atom += static_cast<char>(size >> shift);
+    }
+    return atom + type + body;
+}
+
+std::string Diagnosis(const std::string& content) {
+    const TestFolder folder;
+    WriteFile(folder / "movie.mov", content);
+    return DiagnoseMovie(folder / "movie.mov");
+}
+
+void ExpectSays(const std::string& content, const char* words) {
+    const std::string said = Diagnosis(content);
+    EXPECT_NE(said.find(words), std::string::npos) << said;
+}
+
+const std::string kType = Atom("ftyp", "qt  \0\0\0\0");
+
+}  // namespace
+
+TEST(MovieDiagnosis, TellsFilesThatHoldNothing) {
+    const TestFolder folder;
+    EXPECT_NE(DiagnoseMovie(folder / "none.mov").find("can't be read"), std::string::npos);
+    ExpectSays("", "the file is empty");
+}
+
+TEST(MovieDiagnosis, TellsFilesOfAnotherFamily) {
+    ExpectSays("RIFF1234WAVE", "no movie of the QuickTime family");
+    ExpectSays("abc", "no movie of the QuickTime family");
+    ExpectSays(Atom("abcd", ""), "no movie of the QuickTime family");
+}
+
+TEST(MovieDiagnosis, TellsWhereAFileWasCut) {
+    ExpectSays(kType + Atom("moov", "abcd", 5000), "the movie header is cut off at");
+    ExpectSays(kType + Atom("mdat", "abcd", 5000), "ends inside its 'mdat' atom");
+}
+
+TEST(MovieDiagnosis, TellsThatTheHeaderIsMissing) {
+    ExpectSays(kType + Atom("mdat", "abcd"), "no movie header ('moov')");
+}
+
+TEST(MovieDiagnosis, TellsWhatIsWrongWithTheHeader) {
+    ExpectSays(kType + Atom("moov", ""), "the movie header can't be used: ");
+}
+
+TEST(MovieDiagnosis, IsNotDeceivedBySizesThatLie) {
+    // Sizes below a head, and a 64-bit size beyond all: no endless walk.
+    ExpectSays(kType + Atom("mdat", "", 4), "no movie header");
+    ExpectSays(kType + Atom("mdat", std::string(8, '\xFF'), 1), "ends inside its 'mdat' atom");
+    std::string many;
+    for (int i = 0; i < 1000; ++i) {
+        many += Atom("free", "");
+    }
+    EXPECT_FALSE(Diagnosis(many).empty());
+}

@@ -1,0 +1,84 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/OutputFile.h"
+
+#include <fcntl.h>
+#include <gtest/gtest.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "reference_host/cliphost/Failure.h"
+#include "tests/unit/cliphost/TestFolder.h"
+
+using cliphost::Failure;
+using cliphost::OutputFile;
+using namespace cliphost_tests;
+
+TEST(OutputFile, IsThereOnceItIsFinished) {
+    const TestFolder folder;
+    {
+        OutputFile file(folder / "a.raw");
+        file.Write("one", 3);
+        EXPECT_FALSE(std::filesystem::exists(folder / "a.raw"));
+        file.Write("two", 3);
+        file.Finish();
+        EXPECT_EQ(ContentOf(folder / "a.raw"), "onetwo");
+    }
+    EXPECT_EQ(ContentOf(folder / "a.raw"), "onetwo");
+    EXPECT_EQ(folder.CountFiles(), 1u);
+}
+
+TEST(OutputFile, LeavesNothingWhenItEndsUnfinishedAndKeepsWhatWasThereBefore) {
+    const TestFolder folder;
+    WriteFile(folder / "a.raw", "before");
+    {
+        OutputFile file(folder / "a.raw");
+        file.Write("half", 4);
+    }
+    EXPECT_EQ(ContentOf(folder / "a.raw"), "before");
+    EXPECT_EQ(folder.CountFiles(), 1u);
+}
+
+TEST(OutputFile, TellsWhyItCantBeWritten) {
+    const TestFolder folder;
+    const auto expectFailure = [](const std::filesystem::path& path, const char* why) {
+        try {
+            OutputFile file(path);
+            ADD_FAILURE() << path << " was opened";
+        } catch (const Failure& failure) {
+            EXPECT_EQ(failure.status(), cliphost::kExitCaller);
+            EXPECT_NE(std::string(failure.what()).find(path.string() + ": not written: "),
+                      std::string::npos)
+                << failure.what();
+            EXPECT_NE(std::string(failure.what()).find(why), std::string::npos) << failure.what();
+        }
+    };
+    expectFailure(folder / "no" / "such" / "a.raw", "No such file");
+    expectFailure(folder.path(), "Is a directory");
+}
+
+TEST(OutputFile, TellsOfAFullDisk) {
+    if (access("/dev/full", W_OK) != 0) {
+        GTEST_SKIP() << "there is no /dev/full";
+    }
+    OutputFile file("/dev/full");
+    try {
+        file.Write("x", 1);
+        ADD_FAILURE() << "it was written";
+    } catch (const Failure& failure) {
+        EXPECT_NE(std::string(failure.what()).find("No space"), std::string::npos);
+    }
+}
+
+TEST(OutputFile, TellsThatTheReaderOfAPipeHasGone) {
+    const TestFolder folder;
+    const auto pipe = folder / "pipe";
+    ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+    const int reader = open(pipe.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+    ASSERT_GE(reader, 0);
+    OutputFile file(pipe);
+    file.Write("x", 1);
+    close(reader);
+    EXPECT_THROW(file.Write("x", 1), cliphost::ReaderGone);
+    EXPECT_TRUE(std::filesystem::is_fifo(pipe)) << "a pipe is written as it is";
+}

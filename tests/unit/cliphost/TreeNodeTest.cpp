@@ -1,0 +1,51 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/TreeNode.h"
+
+#include <gtest/gtest.h>
+
+#include <nlohmann/json.hpp>
+
+using cliphost::ToJson;
+using cliphost::ToText;
+using cliphost::TreeNode;
+
+namespace {
+
+TreeNode Mob() {
+    return {"Mob",
+            {{"Name", "\"clip\""}, {"Length", "5"}},
+            {{"Slots", {{"Slot", {{"Id", "1"}}, {}}, {"Slot", {{"Id", "2"}}, {}}}},
+             {"Descriptor", {{"Picture", {}, {}}}}}};
+}
+
+}  // namespace
+
+TEST(TreeNode, ShowsFactsBehindTitlesAndPartsBelow) {
+    EXPECT_EQ(ToText(Mob()),
+              "Mob  Name \"clip\", Length 5\n"
+              "  Slots:\n"
+              "    Slot  Id 1\n"
+              "    Slot  Id 2\n"
+              "  Descriptor: Picture\n");
+}
+
+TEST(TreeNode, ShowsFactsInLinesWhereOneIsTooShort) {
+    TreeNode node{"Mob", {{"A", std::string(80, 'x')}, {"Long", std::string(80, 'y')}}, {}};
+    EXPECT_EQ(ToText(node, 1), "  Mob\n      A     " + std::string(80, 'x') + "\n      Long  " +
+                                   std::string(80, 'y') + "\n");
+}
+
+TEST(TreeNode, IsJsonWithTheSameNames) {
+    const auto json = nlohmann::json::parse(ToJson(Mob()));
+    EXPECT_EQ(json["class"], "Mob");
+    EXPECT_EQ(json["Name"], "\"clip\"");
+    EXPECT_EQ(json["Slots"].size(), 2u);
+    EXPECT_EQ(json["Slots"][1]["Id"], "2");
+    EXPECT_EQ(json["Descriptor"][0]["class"], "Picture");
+}
+
+TEST(TreeNode, IsJsonAlsoWithBytesThatAreNoText) {
+    const TreeNode node{"Mob", {{"Name", "\xFF\xFE"}}, {}};
+    EXPECT_TRUE(nlohmann::json::accept(ToJson(node)));
+}
