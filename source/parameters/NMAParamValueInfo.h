@@ -17,8 +17,10 @@ public:
     // kParamKindOpaque when there is no child.
     ncfUInt32 GetKind() const;
     // Makes way for the new kind, whose attributes are then to be set. A child
-    // that was read from a text stays visible to GetKind until the document is
-    // saved. A number that is no kind leaves an element that can't be saved.
+    // that was read from a text is only marked, and met by all operations until
+    // the document is saved: GetKind may still answer its kind, and setting the
+    // attributes of that kind goes to it and takes the mark away. A number that
+    // is no kind leaves an element that can't be saved.
     NCFRESULT SetKind(ncfUInt32 kind);
 
     NCFRESULT GetSInt32Info(ncfSInt32& outMax, ncfSInt32& outMin, ncfSInt32& outDefault) const;
@@ -46,9 +48,10 @@ public:
     // throws NCF_E_UNEXPECTED.
     NCFRESULT GetDiscreteInfo(ncfUInt32** outValues, ncfUInt32* outCount,
                               ncfUInt32* outDefault) const;
-    // NCF_E_INVALIDARG for values that are null, unless the count is 0. A list
-    // that was read from a text stands in the way of the new one until the
-    // document is saved: reading throws NMA_E_NODATA till then.
+    // NCF_E_INVALIDARG for values that are null, unless the count is 0. Values
+    // that came from a text are only marked, and stand before the new ones until
+    // the document is saved. Till then reading gives both, or throws
+    // NMA_E_NODATA where the old ones had not been read before.
     NCFRESULT SetDiscreteInfo(const ncfUInt32* values, ncfUInt32 count, ncfUInt32 defaultValue);
 
 private:

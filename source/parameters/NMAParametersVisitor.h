@@ -17,7 +17,7 @@ class NMAParametersVisitor {
 public:
     explicit NMAParametersVisitor(INCFComponentFactory* factory);
     NMAParametersVisitor(INCFComponentFactory* factory, INCFParametersXML* handler);
-    ~NMAParametersVisitor();
+    virtual ~NMAParametersVisitor();
     NMAParametersVisitor(const NMAParametersVisitor&) = delete;
     NMAParametersVisitor& operator=(const NMAParametersVisitor&) = delete;
 

@@ -7,6 +7,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
+#include <limits>
 #include <string>
 
 #include "source/descriptor_data/QTAttributesXMLParser.h"
@@ -40,6 +41,45 @@ ncfUInt64 TakeUnsigned(const char*& at) {
     return value;
 }
 
+// Whether a number that no float holds is too large, rather than too small: told
+// by the place of its first digit that is not 0. Requires: `at` is a number
+// without sign, as from_chars took it.
+bool IsTooLarge(const char* at, const char* end) {
+    ncfSInt64 places = 0;  // before the point; below 0 for zeros behind it
+    bool started = false;
+    bool behindPoint = false;
+    for (; at != end && *at != 'e' && *at != 'E'; ++at) {
+        if (*at == '.') {
+            behindPoint = true;
+            continue;
+        }
+        started = started || *at != '0';
+        if (started != behindPoint) {
+            places += started ? 1 : -1;
+        }
+    }
+    const ncfSInt64 exponent = at == end ? 0 : std::strtoll(at + 1, nullptr, 10);
+    return exponent > -places;
+}
+
+// Decimal, with a point, whatever the locale of the process.
+float TakeFloat(const char* at) {
+    at += std::strspn(at, " \t\n\v\f\r");
+    const bool isNegative = *at == '-';
+    if (isNegative || *at == '+') {
+        ++at;
+    }
+    float value = 0;
+    const auto scanned = std::from_chars(at, at + std::strlen(at), value);
+    if (*at == '-' || scanned.ec == std::errc::invalid_argument) {
+        ThrowIfFailed(NCF_E_UNEXPECTED);
+    }
+    if (scanned.ec == std::errc::result_out_of_range) {
+        value = IsTooLarge(at, scanned.ptr) ? std::numeric_limits<float>::infinity() : 0.0f;
+    }
+    return isNegative ? -value : value;
+}
+
 }  // namespace
 
 void Read(const NMAString& text, ncfSInt32& out) {
@@ -68,12 +108,7 @@ void Read(const NMAString& text, ncfUInt64& out) {
 void Read(const NMAString& text, double& out) {
     static_assert(sizeof(float) == sizeof(ncfUInt32) && sizeof(double) == sizeof(ncfUInt64),
                   "the bits of a float fill half a double");
-    const char* const at = text.GetUTF8String();
-    char* end = nullptr;
-    const float scanned = std::strtof(at, &end);
-    if (end == at) {
-        ThrowIfFailed(NCF_E_UNEXPECTED);
-    }
+    const float scanned = TakeFloat(text.GetUTF8String());
     ncfUInt32 low = 0;
     std::memcpy(&low, &scanned, sizeof low);
     const ncfUInt64 bits = low;

@@ -4,6 +4,7 @@
 #include "source/parameters/NMAParamElement.h"
 
 #include <functional>
+#include <type_traits>
 
 #include "source/parameters/NMAParametersVisitor.h"
 #include "tests/unit/parameters/ParamTest.h"
@@ -42,9 +43,30 @@ protected:
     NMAParameter parameter;
 };
 
-TEST_F(ParamElement, IsATableAndOnePointer) {
-    EXPECT_EQ(sizeof(NMAParamElement), 2 * sizeof(void*));
-    EXPECT_EQ(sizeof(NMAParameter), 2 * sizeof(void*));
+template <class... Views>
+void ExpectTableAndOnePointer() {
+    const bool derived[] = {std::is_base_of_v<NMAParamElement, Views>...};
+    const bool deletable[] = {std::has_virtual_destructor_v<Views>...};
+    const std::size_t sizes[] = {sizeof(Views)...};
+    for (std::size_t i = 0; i < sizeof...(Views); ++i) {
+        EXPECT_TRUE(derived[i]) << i;
+        EXPECT_TRUE(deletable[i]) << i;
+        EXPECT_EQ(sizes[i], 2 * sizeof(void*)) << i;
+    }
+}
+
+TEST_F(ParamElement, EveryViewIsATableAndOnePointer) {
+    ExpectTableAndOnePointer<NMAParamElement, NMAParamComponent, NMAParamTrack, NMAParamInfos,
+                             NMAParamInfoGroup, NMAParamInfoParam, NMAParamValueInfo, NMAParamSet,
+                             NMAParameter>();
+}
+
+TEST_F(ParamElement, SuiteAndVisitorMayBeDeletedThroughTheirBases) {
+    EXPECT_TRUE((std::is_base_of_v<NMAXmlDoc, NMAParameterSuite>));
+    EXPECT_TRUE(std::has_virtual_destructor_v<NMAParameterSuite>);
+    EXPECT_TRUE(std::has_virtual_destructor_v<NMAParametersVisitor>);
+    EXPECT_EQ(sizeof(NMAParametersVisitor), 5 * sizeof(void*))
+        << "a table, the factory, the object and two documents";
 }
 
 TEST_F(ParamElement, OperationsOfAnEmptyComponentThrow) {

@@ -84,6 +84,26 @@ TEST_F(ParamValueInfo, SetKindMarksAnElementOfTheTextAndItStaysVisibleUntilSaved
     EXPECT_EQ(rootOf<NMAParamValueInfo>(text).GetKind(), 1u);
 }
 
+TEST_F(ParamValueInfo, AMarkedElementComesBackWhenItsAttributesAreSet) {
+    NMAParamValueInfo info = load("<valueInfoSInt32 max=\"3\" min=\"1\" default=\"2\"/>");
+    info.SetKind(0);
+    EXPECT_EQ(info.SetSInt32Info(9, 8, 7), NCF_OK);
+    EXPECT_EQ(saved(),
+              "<valueInfo><valueInfoSInt32 max=\"9\" min=\"8\" default=\"7\"/>"
+              "<valueInfoSInt32/></valueInfo>")
+        << "the first of its kind is the one that was marked";
+    ncfSInt32 max = 0, min = 0, def = 0;
+    EXPECT_EQ(rootOf<NMAParamValueInfo>(saved()).GetSInt32Info(max, min, def), NCF_OK);
+    EXPECT_EQ(max, 9);
+}
+
+TEST_F(ParamValueInfo, AMarkedElementIsTheFirstFoundByAFurtherSetKind) {
+    NMAParamValueInfo info = load("<valueInfoSInt32/>");
+    info.SetKind(1);
+    info.SetKind(2);
+    EXPECT_EQ(saved(), "<valueInfo><valueInfoUInt32/><valueInfoSInt64/></valueInfo>");
+}
+
 TEST_F(ParamValueInfo, SetKindToALowerNumberIsSeenAtOnce) {
     NMAParamValueInfo info = load("<valueInfoString/>");
     info.SetKind(7);
@@ -312,12 +332,24 @@ TEST_F(ParamValueInfo, ANewListReplacesOneOfTheTextWhenSaved) {
     EXPECT_EQ(discrete(rootOf<NMAParamValueInfo>(text)), (std::vector<ncfUInt32>{9}));
 }
 
+TEST_F(ParamValueInfo, ANewListStandsBehindOneThatWasReadUntilSaved) {
+    NMAParamValueInfo info = load(
+        "<valueInfoDiscrete default=\"1\"><discrete value=\"1\">1</discrete></valueInfoDiscrete>");
+    EXPECT_EQ(discrete(info), (std::vector<ncfUInt32>{1}));
+    const ncfUInt32 values[] = {9, 8};
+    info.SetDiscreteInfo(values, 2, 9);
+    EXPECT_EQ(discrete(info), (std::vector<ncfUInt32>{1, 9, 8}));
+    EXPECT_EQ(discreteDefault, 9u);
+    EXPECT_EQ(discrete(rootOf<NMAParamValueInfo>(saved())), (std::vector<ncfUInt32>{9, 8}));
+}
+
 TEST_F(ParamValueInfo, DiscreteInfoThatCannotBeReadLeavesTheOutputs) {
     struct {
         const char* content;
         NCFRESULT failure;
     } const kCases[] = {
         {"<valueInfoDiscrete default=\"1\"/>", NCF_E_UNEXPECTED},
+        {"<valueInfoDiscrete/>", NMA_E_NODATA},
         {"<valueInfoDiscrete><discrete value=\"1\"/></valueInfoDiscrete>", NMA_E_NODATA},
         {"<valueInfoDiscrete default=\"x\"><discrete value=\"1\"/></valueInfoDiscrete>",
          NCF_E_UNEXPECTED},

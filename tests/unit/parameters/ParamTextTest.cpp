@@ -3,8 +3,11 @@
 
 #include "source/parameters/ParamText.h"
 
+#include <clocale>
+#include <cstdlib>
 #include <cstring>
 #include <limits>
+#include <string>
 
 #include "tests/unit/parameters/ParamTest.h"
 
@@ -91,6 +94,73 @@ TEST_F(ParamTexts, DoublesReadAsTheBitsOfAFloatInTheLowHalf) {
     EXPECT_GT(read<double>("1.5"), 0.0);
 }
 
+TEST_F(ParamTexts, DoublesMayHaveSpaceBeforeAndAnythingBehind) {
+    const ncfUInt64 kOneAndAHalf = 0x3FC00000u;
+    for (const char* const text :
+         {" \t\r\n\v\f1.5", "+1.5", "15e-1", ".15e+1", "1.5 frames", "1.5e", "1.5.7",
+          "001.50000000000000000000000000000000000000000000"}) {
+        EXPECT_EQ(bitsOf(read<double>(text)), kOneAndAHalf) << text;
+    }
+    EXPECT_EQ(bitsOf(read<double>("inf")), 0x7F800000u) << "as it is written";
+    EXPECT_EQ(bitsOf(read<double>("-inf")), 0xFF800000u);
+    EXPECT_EQ(bitsOf(read<double>("nan")), 0x7FC00000u);
+    EXPECT_EQ(bitsOf(read<double>("-0")), 0x80000000u);
+}
+
+TEST_F(ParamTexts, DoublesThatNoFloatHoldsAreEndlessOrNothing) {
+    const std::string zeros(400, '0');
+    for (const std::string& large :
+         {std::string("1e39"), std::string("1e400"), std::string("1e99999999999999999999"),
+          "1" + zeros, "1" + zeros + ".5", "0." + zeros + "1e500", "1" + zeros + "e-300"}) {
+        EXPECT_EQ(bitsOf(read<double>(large.c_str())), 0x7F800000u) << large;
+        EXPECT_EQ(bitsOf(read<double>(("-" + large).c_str())), 0xFF800000u) << large;
+    }
+    for (const std::string& small :
+         {std::string("1e-46"), std::string("0.7e-45"), std::string("1e-99999999999999999999"),
+          "0." + zeros + "1", zeros + "." + zeros + "1", "0." + zeros + "1e300",
+          "1" + zeros + "e-500"}) {
+        EXPECT_EQ(bitsOf(read<double>(small.c_str())), 0u) << small;
+        EXPECT_EQ(bitsOf(read<double>(("-" + small).c_str())), 0x80000000u) << small;
+    }
+    EXPECT_EQ(bitsOf(read<double>("1e-45")), 1u) << "the smallest there is";
+}
+
+// Sets a locale whose numbers have a comma: one that is installed, or one made
+// for the test. False where neither is to be had.
+bool SetCommaLocale() {
+    for (const char* const name : {"de_DE.UTF-8", "fr_FR.UTF-8", "sv_SE.UTF-8"}) {
+        if (std::setlocale(LC_NUMERIC, name)) {
+            return true;
+        }
+    }
+    const std::string folder = testing::TempDir() + "comma_locale";
+    const std::string make =
+        "mkdir -p '" + folder + "' && localedef -i de_DE -f UTF-8 '" + folder + "/de_DE.UTF-8'";
+    if (std::system((make + " >/dev/null 2>&1").c_str()) != 0) {
+        return false;
+    }
+    setenv("LOCPATH", folder.c_str(), 1);
+    const bool isSet = std::setlocale(LC_NUMERIC, "de_DE.UTF-8") != nullptr;
+    unsetenv("LOCPATH");
+    return isSet;
+}
+
+TEST_F(ParamTexts, DoublesHaveAPointWhateverTheLocale) {
+    const std::string before = std::setlocale(LC_NUMERIC, nullptr);
+    if (!SetCommaLocale()) {
+        GTEST_SKIP() << "no locale with a decimal comma, and none could be made";
+    }
+    const std::string point = std::localeconv()->decimal_point;
+    const std::string text = written(ParamText::Write(1.5));
+    const ncfUInt64 withPoint = bitsOf(read<double>("1.5"));
+    const ncfUInt64 withComma = bitsOf(read<double>("1,5"));
+    std::setlocale(LC_NUMERIC, before.c_str());
+    EXPECT_EQ(point, ",");
+    EXPECT_EQ(text, "1.500000");
+    EXPECT_EQ(withPoint, 0x3FC00000u);
+    EXPECT_EQ(withComma, 0x3F800000u) << "ends at the comma";
+}
+
 TEST_F(ParamTexts, ADoubleDoesNotSurviveTheRoundTrip) {
     const double back = read<double>(written(ParamText::Write(1.5)).c_str());
     EXPECT_NE(back, 1.5);
@@ -98,7 +168,7 @@ TEST_F(ParamTexts, ADoubleDoesNotSurviveTheRoundTrip) {
 }
 
 TEST_F(ParamTexts, TextWithoutDoubleIsUnexpected) {
-    for (const char* const text : {"", " ", "abc", ".", "-", "e5"}) {
+    for (const char* const text : {"", " ", "abc", ".", "-", "e5", "--1", "+-1", "- 1", ",5"}) {
         EXPECT_EQ(failure<double>(text), NCF_E_UNEXPECTED) << text;
     }
 }
