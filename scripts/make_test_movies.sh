@@ -1,13 +1,15 @@
 #!/usr/bin/env bash
-# Makes the movies that the system tests describe: make_test_movies.sh FOLDER
+# Makes the movies that the system tests describe:
+# make_test_movies.sh FOLDER [LIST]
 #
-# The movies are those of tests/support/movies_ffmpeg/list.sh. One that is there
-# already is kept, so a second run costs nothing; a changed list makes all anew.
+# The movies are those of tests/support/movies_ffmpeg/list.sh, or of another list
+# there. One that is there already is kept, so a second run costs nothing; a
+# changed list makes all anew.
 # The same FFmpeg gives the same bytes: one thread, no encoder's names, fixed
 # dates.
 set -euo pipefail
 folder=$1
-list=$(dirname "${BASH_SOURCE[0]}")/../tests/support/movies_ffmpeg/list.sh
+list=$(dirname "${BASH_SOURCE[0]}")/../tests/support/movies_ffmpeg/${2:-list}.sh
 mkdir -p "$folder"
 
 fail() { printf 'make_test_movies: %s\n' "$*" >&2; exit 1; }
@@ -15,7 +17,7 @@ command -v ffmpeg >/dev/null || fail 'ffmpeg is needed; install the package ffmp
 
 stamp=$(cat "$list" "${BASH_SOURCE[0]}" | sha256sum)
 if [ "$(cat "$folder/.made" 2>/dev/null)" != "$stamp" ]; then
-  rm -f "$folder"/*.mov "$folder"/*.mp4 "$folder"/*.m4a "$folder/.made"
+  rm -f "$folder"/*.* "$folder/.made"
 fi
 
 # A picture of moving patterns: video SIZE RATE FRAMES

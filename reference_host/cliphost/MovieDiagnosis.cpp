@@ -12,6 +12,7 @@
 #include <set>
 
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/quicktime/OpenProblem.h"
 
 namespace cliphost {
 namespace {
@@ -78,6 +79,19 @@ TopLevel ReadTopLevel(std::ifstream& stream, std::uint64_t size) {
     return top;
 }
 
+// The header parser's own reason.
+std::string HeaderProblem(std::ifstream& stream) {
+    const auto parser = host::MakeRef<header_parser::QTParser>();
+    const auto readAt = [&stream](ncfUInt64 position, ncfUInt8* to, ncfUInt32 wanted) {
+        stream.clear();
+        stream.seekg(static_cast<std::streamoff>(position));
+        stream.read(reinterpret_cast<char*>(to), wanted);
+        return static_cast<ncfUInt32>(stream.gcount());
+    };
+    return header_parser::ReadHeaders(*parser, readAt) < 0 ? parser->Refusal().reason
+                                                           : "it names no picture and no sound";
+}
+
 }  // namespace
 
 std::string DiagnoseMovie(const std::filesystem::path& movie) {
@@ -91,18 +105,17 @@ std::string DiagnoseMovie(const std::filesystem::path& movie) {
         return "the file is empty; copy it again from where it came";
     }
     const TopLevel top = ReadTopLevel(stream, size);
-    if (!top.isFamily) {
-        return "the file is no movie of the QuickTime family: it does not start with an atom of "
-               "one; convert it to .mov or .mp4";
+    const std::string opening = host::OpenProblem(movie);
+    if (!top.isFamily && !opening.empty()) {
+        return fmt::format(
+            "the file is no movie of the QuickTime family, and can't be opened as another kind of "
+            "movie, sound or picture either ({}); convert it to .mov or .mp4",
+            opening);
     }
-    if (top.atoms.count("moof") > 0) {
-        return "the movie is fragmented: its samples are told in pieces all over the file; remux "
-               "it, for instance with ffmpeg -i FILE -c copy -movflags +faststart NEW.mov";
-    }
-    if (top.cutAtom == "moov") {
+    if (top.isFamily && top.cutAtom == "moov") {
         return fmt::format("the movie header is cut off at {} bytes; copy the file again", size);
     }
-    if (top.atoms.count("moov") == 0) {
+    if (top.isFamily && top.atoms.count("moov") == 0) {
         return top.cutAtom.empty()
                    ? "the file holds no movie header ('moov'), so nothing tells its tracks"
                    : fmt::format(
@@ -110,19 +123,16 @@ std::string DiagnoseMovie(const std::filesystem::path& movie) {
                          "copy it again",
                          top.cutAtom);
     }
-    // The header is there: the parser's own reason tells what it found.
-    const auto parser = host::MakeRef<header_parser::QTParser>();
-    const auto readAt = [&stream](ncfUInt64 position, ncfUInt8* to, ncfUInt32 wanted) {
-        stream.clear();
-        stream.seekg(static_cast<std::streamoff>(position));
-        stream.read(reinterpret_cast<char*>(to), wanted);
-        return static_cast<ncfUInt32>(stream.gcount());
-    };
-    if (header_parser::ReadHeaders(*parser, readAt) < 0) {
-        return fmt::format("the movie header can't be used: {}", parser->Refusal().reason);
+    if (opening.empty() && top.atoms.count("moof") > 0) {
+        return "the movie is fragmented, and nothing of use is in its fragments; make it again "
+               "from where it came";
     }
-    return "the movie header can be read, but the movie has no length above 0, or is longer than "
-           "the 24 hours that its timecode can count";
+    if (opening.empty()) {
+        return "the file can be opened, but it holds neither picture nor sound, or its length is "
+               "not above 0, or it is longer than the 24 hours that its timecode can count";
+    }
+    return fmt::format("the movie header can't be used: {}; nor can it be read another way: {}",
+                       HeaderProblem(stream), opening);
 }
 
 }  // namespace cliphost

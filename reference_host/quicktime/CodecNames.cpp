@@ -181,6 +181,25 @@ std::string OwnName(ncfUInt32 code) {
     return {};
 }
 
+// Codes of still pictures that movies hold by another codec's name.
+struct StillRow {
+    AVCodecID codec;
+    const char* code;
+};
+constexpr StillRow kStills[] = {
+    {AV_CODEC_ID_BMP, "WRLE"},   {AV_CODEC_ID_PSD, "8BPS"}, {AV_CODEC_ID_SGI, ".SGI"},
+    {AV_CODEC_ID_TARGA, "tga "}, {AV_CODEC_ID_PCX, "PCX "},
+};
+
+// The first four characters, spaces behind a shorter text.
+ncfUInt32 CodeOf(const char* text) {
+    ncfUInt32 code = 0;
+    for (int i = 0; i < 4; ++i) {
+        code = code << 8 | static_cast<unsigned char>(*text != 0 ? *text++ : ' ');
+    }
+    return code;
+}
+
 // Codecs with several codes in movies, each of which means something of its own.
 bool HasManyCodes(AVCodecID codec) {
     return codec == AV_CODEC_ID_PRORES || codec == AV_CODEC_ID_DVVIDEO ||
@@ -210,8 +229,21 @@ NCFRESULT CodecName(ncfUInt32 code, std::string& name) {
 }
 
 ncfUInt32 CodecCode(const AVCodecParameters& form) {
-    const ncfUInt32 code = Swapped(form.codec_tag);
-    return IsText(code) ? code : CodeInMovies(form);
+    if (IsText(Swapped(form.codec_tag))) {
+        return Swapped(form.codec_tag);
+    }
+    if (const ncfUInt32 code = CodeInMovies(form)) {
+        return code;
+    }
+    for (const StillRow& row : kStills) {
+        if (row.codec == form.codec_id) {
+            return CodeOf(row.code);
+        }
+    }
+    const AVCodecTag* const tables[] = {avformat_get_riff_video_tags(), nullptr};
+    const ncfUInt32 code = Swapped(av_codec_get_tag(tables, form.codec_id));
+    const AVCodecDescriptor* const codec = avcodec_descriptor_get(form.codec_id);
+    return IsText(code) ? code : codec ? CodeOf(codec->name) : 0;
 }
 
 std::string CodecNameOf(const AVCodecParameters& form) {

@@ -16,7 +16,8 @@ namespace host {
 NCFRESULT CodecName(ncfUInt32 code, std::string& name);
 
 // The code of a stream's codec: its tag, or for a tag that is no text the code
-// that the codec has in movies. 0 for none.
+// that the codec has in movies or elsewhere. What has none goes by the first
+// letters of its name. 0 for codecs that nobody knows.
 ncfUInt32 CodecCode(const AVCodecParameters& form);
 
 // A person's name for a stream's codec; empty only for codecs that nobody knows.

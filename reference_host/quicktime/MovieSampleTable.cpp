@@ -23,10 +23,11 @@ void FillDecodeTimes(std::vector<PacketEntry>& packets, ncfSInt64 mediaDuration)
         if (packet.displayTime == AV_NOPTS_VALUE) {
             packet.displayTime = packet.decodeTime;
         }
-        next = packet.decodeTime + packet.duration;
+        next = std::min(packet.decodeTime + packet.duration, kFarthestTime);
     }
     for (std::size_t i = 0; i + 1 < packets.size(); ++i) {
-        packets[i].duration = packets[i + 1].decodeTime - packets[i].decodeTime;
+        packets[i].duration =
+            std::max<ncfSInt64>(packets[i + 1].decodeTime - packets[i].decodeTime, 0);
     }
     if (packets.empty() || packets.back().duration > 0) {
         return;
@@ -77,7 +78,7 @@ MovieSampleTable::Track MovieSampleTable::Load(int stream) const {
     track.isPlain =
         source_.indexIsWhole || (FieldsAreTogether(track.packets) &&
                                  AreStoredPlain(source_.path, stream, kPacketsToCompare));
-    FillDecodeTimes(track.packets, input->streams[stream]->duration);
+    FillDecodeTimes(track.packets, UsableDuration(input->streams[stream]->duration));
     track.samples = track.packets.size();
     track.runEnds = RunEnds(track.packets);
     if (const auto found = source_.descriptionChanges.find(stream);

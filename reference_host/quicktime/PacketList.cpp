@@ -31,7 +31,7 @@ std::vector<PacketEntry> FromIndex(AVStream& stream) {
     for (int i = 0; i < count; ++i) {
         const AVIndexEntry* const entry = avformat_index_get_entry(&stream, i);
         PacketEntry packet;
-        packet.decodeTime = packet.displayTime = entry->timestamp;
+        packet.decodeTime = packet.displayTime = UsableTime(entry->timestamp);
         packet.position = entry->pos;
         packet.size = static_cast<ncfUInt32>(entry->size);
         packet.isSync = (entry->flags & AVINDEX_KEYFRAME) != 0;
@@ -44,17 +44,17 @@ std::vector<PacketEntry> FromIndex(AVStream& stream) {
     if (packets.size() > 1) {
         packets.back().duration = packets[packets.size() - 2].duration;
     } else if (packets.size() == 1) {
-        packets.back().duration = std::max<ncfSInt64>(stream.duration, 0);
+        packets.back().duration = UsableDuration(stream.duration);
     }
     return packets;
 }
 
 PacketEntry EntryOf(const AVPacket& packet) {
     PacketEntry entry;
-    entry.decodeTime = packet.dts;
-    entry.displayTime = packet.pts;
+    entry.decodeTime = UsableTime(packet.dts);
+    entry.displayTime = UsableTime(packet.pts);
     entry.position = packet.pos;
-    entry.duration = packet.duration;
+    entry.duration = UsableDuration(packet.duration);
     entry.size = static_cast<ncfUInt32>(packet.size);
     entry.isSync = (packet.flags & AV_PKT_FLAG_KEY) != 0;
     entry.isDisposable = (packet.flags & AV_PKT_FLAG_DISPOSABLE) != 0;
@@ -116,6 +116,14 @@ bool IndexSaysAll(const std::vector<PacketEntry>& packets, const AVStream& strea
 }
 
 }  // namespace
+
+ncfSInt64 UsableTime(ncfSInt64 time) {
+    return time > -kFarthestTime && time < kFarthestTime ? time : AV_NOPTS_VALUE;
+}
+
+ncfSInt64 UsableDuration(ncfSInt64 duration) {
+    return duration > 0 && duration < kFarthestTime ? duration : 0;
+}
 
 std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool indexIsWhole) {
     std::vector<PacketEntry> packets;

@@ -30,6 +30,12 @@ struct PacketEntry {
     } second;
 };
 
+// Times beyond this come from damaged files alone. Sums of a few stay in range.
+constexpr ncfSInt64 kFarthestTime = ncfSInt64{1} << 60;
+// A time that can be reckoned with, else unknown; a duration likewise, else 0.
+ncfSInt64 UsableTime(ncfSInt64 time);
+ncfSInt64 UsableDuration(ncfSInt64 duration);
+
 // The packets of a stream in decode order. Where the container has an index and
 // the codec keeps its pictures in order, the index says all; else the packets
 // are read through once. `indexIsWhole`: the container's index names all of

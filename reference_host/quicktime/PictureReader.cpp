@@ -64,6 +64,7 @@ PictureReader::PictureReader(std::filesystem::path path, InputOwner input, Codec
       stream_(stream),
       order_(std::move(order)),
       isSeekable_(TellsTimesOfAll(*input_)),
+      marksCutPackets_(IsMovieFamily(*input_)),
       cache_(kMostCachedBytes),
       packet_(av_packet_alloc()) {}
 
@@ -154,8 +155,11 @@ bool PictureReader::Feed() {
             codec_->reordered_opaque = static_cast<ncfSInt64>(at);
             ++decodedPackets_;
             // A packet that the decoder refuses leaves its picture out; the
-            // next may be good.
-            avcodec_send_packet(codec_.get(), packet_.get());
+            // next may be good. What is left of one behind a file's end some
+            // decoders take for a whole.
+            if (!marksCutPackets_ || (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0) {
+                avcodec_send_packet(codec_.get(), packet_.get());
+            }
         }
     }
     av_packet_unref(packet_.get());

@@ -49,6 +49,7 @@ private:
     int stream_;
     PictureOrder order_;
     bool isSeekable_;
+    bool marksCutPackets_;  // a packet marked as corrupt is one that the file's end cut
     PictureCache cache_;
     PacketOwner packet_;
 

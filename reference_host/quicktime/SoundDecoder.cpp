@@ -6,6 +6,7 @@
 #include <algorithm>
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/PacketList.h"
 #include "reference_host/quicktime/SoundForm.h"
 #include "reference_host/quicktime/SoundWords.h"
 
@@ -56,7 +57,7 @@ SoundDecoder::SoundDecoder(InputOwner input, CodecOwner codec, int stream)
     const AVStream& of = *input_->streams[stream_];
     // Movies begin at 0 of their own time; other files where their first
     // stream does.
-    if (!IsMovieFamily(*input_) && input_->start_time != AV_NOPTS_VALUE) {
+    if (!IsMovieFamily(*input_) && UsableTime(input_->start_time) != AV_NOPTS_VALUE) {
         zeroTime_ = av_rescale_q(input_->start_time, AVRational{1, AV_TIME_BASE}, of.time_base);
     }
     tolerance_ = 1 + 2 * av_rescale_rnd(of.codecpar->sample_rate, of.time_base.num,
@@ -128,7 +129,7 @@ bool SoundDecoder::Advance() {
             continue;
         }
         const ncfSInt64 follows = blockStart_ + blockCount_;
-        const ncfSInt64 time = frame_->best_effort_timestamp;
+        const ncfSInt64 time = UsableTime(frame_->best_effort_timestamp);
         ncfSInt64 start = time == AV_NOPTS_VALUE ? follows : PlaceOf(time);
         if (isPlaced_ && std::abs(start - follows) <= tolerance_) {
             start = follows;

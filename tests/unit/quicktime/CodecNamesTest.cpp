@@ -68,8 +68,16 @@ TEST(CodecNames, GivesACodeOfMoviesForATagThatIsNoText) {
     EXPECT_EQ(host::CodecCode(form), Number("avc1"));
     form.codec_tag = MKTAG('H', '2', '6', '4');
     EXPECT_EQ(host::CodecCode(form), Number("H264"));
-    form.codec_id = AV_CODEC_ID_NONE;
     form.codec_tag = 0;
+    form.codec_id = AV_CODEC_ID_BMP;
+    EXPECT_EQ(host::CodecCode(form), Number("WRLE"));
+    form.codec_id = AV_CODEC_ID_PSD;
+    EXPECT_EQ(host::CodecCode(form), Number("8BPS"));
+    form.codec_id = AV_CODEC_ID_HUFFYUV;
+    EXPECT_EQ(host::CodecCode(form), Number("HFYU"));
+    form.codec_id = AV_CODEC_ID_XBM;
+    EXPECT_EQ(host::CodecCode(form), Number("xbm "));
+    form.codec_id = AV_CODEC_ID_NONE;
     EXPECT_EQ(host::CodecCode(form), 0u);
 }
 
