@@ -81,11 +81,12 @@ protected:
         changed.suite.SaveToString(text);
         return parameters->SetParameterValuesXML(text.InArg());
     }
-    std::string valuesText() {
-        NCFSmartPtr<INCFString> text;
-        text.attach(MakeHostString(""));
-        EXPECT_EQ(parameters->GetParameterValuesXML(text.inArg()), NCF_OK);
-        return TextOf(text.inArg());
+    NCFRESULT apply(const std::string& document) {
+        return parameters->SetParameterValuesXML(NMAString(document.c_str()).InArg());
+    }
+    std::string valuesText() { return written(&INCFParametersXML::GetParameterValuesXML); }
+    std::string descriptionText() {
+        return written(&INCFParametersXML::GetParameterDescriptionXML);
     }
     static std::string shortNameOf(const NMAParamInfoParam& param) {
         NMAString text;
@@ -97,6 +98,12 @@ protected:
     std::unique_ptr<NMAParametersVisitor> visitor;
 
 private:
+    std::string written(NCFRESULT (INCFParametersXML::*operation)(INCFString*)) {
+        NCFSmartPtr<INCFString> text;
+        text.attach(MakeHostString(""));
+        EXPECT_EQ((parameters.inArg()->*operation)(text.inArg()), NCF_OK);
+        return TextOf(text.inArg());
+    }
     template <class Make>
     void serve(const GUID& component, Make make) {
         host->maker(component, [make](const GUID& iid, void** out) {
@@ -117,6 +124,7 @@ TEST_F(ParametersRoundTrip, TheViewsReadTheDescription) {
     ASSERT_EQ(component.GetTrackCount(), 1u);
     ASSERT_EQ(component.GetTrack(0, track), NCF_OK);
     ASSERT_EQ(track.GetParameterInfos(infos), NCF_OK);
+    EXPECT_EQ(infos.GetGroupCount(), 1u);
     ASSERT_EQ(infos.GetGroup(kParamGroup, group), NCF_OK);
     EXPECT_EQ(group.GetParameterCount(), 3u);
     struct {
@@ -166,6 +174,16 @@ TEST_F(ParametersRoundTrip, TheDescriptionHoldsTheSetInUseToo) {
     EXPECT_EQ(set.GetParameterCount(), 3u);
 }
 
+TEST_F(ParametersRoundTrip, AFileWithoutAnOrderHasNoDefaultOrder) {
+    record().detectedFieldOrder = 8192;
+    host::ParameterDocument document;
+    std::string problem;
+    ASSERT_EQ(host::ReadParameterDocument(descriptionText(), document, problem), NCF_OK);
+    const auto& described = document.components.at(0).tracks.at(0).groups.at(0).parameters;
+    EXPECT_FALSE(described.at(0).defaultValue);
+    EXPECT_EQ(described.at(1).defaultValue, 2u);
+}
+
 TEST_F(ParametersRoundTrip, TheVisitorReadsWhatHolds) {
     record() = {4096, 2, 3, 512};
     EXPECT_EQ(attached().HasParameterSet(kComponent, 0, kParamSetDefault), 1);
@@ -178,7 +196,9 @@ TEST_F(ParametersRoundTrip, TheVisitorReadsWhatHolds) {
 
 TEST_F(ParametersRoundTrip, AWriteReachesTheClipAndTheMapping) {
     attached();
+    journal.clear();
     EXPECT_EQ(visitor->SetUInt32(kComponent, 0, kParamSetDefault, kParamLevelRemapping, 1), NCF_OK);
+    EXPECT_EQ(journal.count("lock"), 1) << "one refresh";
     EXPECT_EQ(record().levelRemap, 1u);
     EXPECT_EQ(mapping->_levelRemap, 1u) << "the mapping followed";
     EXPECT_EQ(record().fieldOrderInFile, 512u);
@@ -226,6 +246,26 @@ TEST_F(ParametersRoundTrip, WhatIsNotInTheDocumentIsNoData) {
     EXPECT_EQ(record().levelRemap, 16u);
 }
 
+TEST_F(ParametersRoundTrip, ValuesOfOneClipAreTakenByAnother) {
+    record() = {4096, 1, 2, 512};
+    const std::string saved = valuesText();
+    record() = {};
+    EXPECT_EQ(apply(saved), NCF_OK);
+    EXPECT_EQ(record().fieldOrderInFile, 4096u);
+    EXPECT_EQ(record().levelRemap, 1u);
+    EXPECT_EQ(record().fieldLayout, 2u);
+    EXPECT_EQ(record().detectedFieldOrder, 8192u) << "that is not in documents";
+    EXPECT_EQ(valuesText(), saved);
+}
+
+TEST_F(ParametersRoundTrip, ADescriptionIsADocumentOfValuesToo) {
+    record().fieldLayout = 3;
+    const std::string saved = descriptionText();
+    record().fieldLayout = 1;
+    EXPECT_EQ(apply(saved), NCF_OK);
+    EXPECT_EQ(record().fieldLayout, 3u);
+}
+
 TEST_F(ParametersRoundTrip, AResetIsSeenByTheNextUpdate) {
     attached();
     visitor->SetUInt32(kComponent, 0, kParamSetDefault, kParamLevelRemapping, 1);
@@ -236,6 +276,22 @@ TEST_F(ParametersRoundTrip, AResetIsSeenByTheNextUpdate) {
 }
 
 // --- documents changed by hand -------------------------------------------------
+
+// A value that the host's reader doesn't carry holds nothing.
+TEST_F(ParametersRoundTrip, AValueOfAnotherKindEndsTheReadingWhereItStands) {
+    journal.clear();
+    EXPECT_EQ(
+        apply("<ncfComponents><component id='0E74B673-0CA8-403B-A142-986D79508637'>"
+              "<track number='0'><parameterSet id='11111111-2222-3333-4444-5555AAAABBBB'>"
+              "<parameter id='76320B7E-5BF9-4E30-BF04-2BE7D48D4C69'><valueUInt32>3</valueUInt32>"
+              "</parameter><parameter id='6CAEDE80-2DE0-4E2F-9F5D-904B7A2C2F4A'>"
+              "<valueString>Progressive</valueString></parameter></parameterSet></track>"
+              "</component></ncfComponents>"),
+        NCF_E_FAIL);
+    EXPECT_EQ(record().fieldLayout, 3u) << "what came before stays";
+    EXPECT_EQ(record().fieldOrderInFile, 512u);
+    EXPECT_EQ(journal.count("lock"), 0) << "no refresh";
+}
 
 TEST_F(ParametersRoundTrip, ASetThatIsNotInUseIsNotTaken) {
     auto changed = values();
