@@ -19,6 +19,7 @@ struct AudioOptions {
     std::optional<ncfUInt32> track;
     std::uint64_t start = 0;
     std::optional<std::uint64_t> count;
+    unsigned rate = 0;  // 0: the movie's own
     std::filesystem::path output;
 };
 
@@ -59,11 +60,21 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     const ClipTrack& track = essence.Track(options.track, TrackKind::Sound);
     SoundReader sound(essence, track);
     const std::uint64_t count = WantedCount(options, sound);
-    const std::vector<unsigned char> header = WavHeader(sound.form(), count);
+    WavForm form = sound.form();
+    if (form.rate == 0) {
+        form.rate = options.rate;
+    }
+    if (form.rate == 0) {
+        throw Failure(
+            kExitCaller,
+            fmt::format("{}: its samples a second are not known, since the movie can't be "
+                        "described; give --rate, such as --rate 48000",
+                        DisplayPath(options.movie)));
+    }
+    const std::vector<unsigned char> header = WavHeader(form, count);
     if (header.empty()) {
         throw Failure(kExitFile, fmt::format("{}: {} channels at {} Hz are no form of a WAV file",
-                                             DisplayPath(options.movie), sound.form().channels,
-                                             sound.form().rate));
+                                             DisplayPath(options.movie), form.channels, form.rate));
     }
     std::error_code ignored;
     if (std::filesystem::equivalent(options.output, options.movie, ignored)) {
@@ -75,7 +86,7 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
         OutputFile output(options.output);
         output.Write(header.data(), header.size());
         silent = Copy(sound, options.start, count, output);
-        if (WavNeedsPadding(sound.form(), count)) {
+        if (WavNeedsPadding(form, count)) {
             output.Write("", 1);
         }
         output.Finish();
@@ -84,7 +95,7 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     }
     if (!OutputFile::IsStandardOutput(options.output)) {
         fmt::print("{}: {} samples of {} channels, 24 bits at {} Hz\n", DisplayPath(options.output),
-                   count, sound.form().channels, sound.form().rate);
+                   count, form.channels, form.rate);
     }
     if (silent > 0) {
         fmt::print(stderr, "cliphost: {}: {} of {} samples could not be read and are silence\n",
@@ -107,11 +118,13 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_option("--start", options->start, "The first sample, from 0")->capture_default_str();
     verb->add_option("--count", options->count, "How many samples; all when not given")
         ->check(CLI::PositiveNumber);
+    verb->add_option("--rate", options->rate,
+                     "Samples a second of a movie that can't be described and so does not tell");
     verb->add_option("-o,--output", options->output, "The WAV file, or - for standard output")
         ->required();
     verb->callback([&session, &status, options] {
         Session running(session);
-        Essence essence(running, options->movie);
+        Essence essence = OpenEssence(running, options->movie);
         status = WriteSound(essence, *options);
     });
 }

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/ClipTracks.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 
 #include "host_interfaces/aaf/AAFDescriptors.h"
@@ -59,6 +61,12 @@ const char* NameOf(TrackKind kind) {
         default:
             return "sound";
     }
+}
+
+std::string RateText(const ClipTrack& track) {
+    return track.RateAsNumber() > 0.0
+               ? fmt::format("{}/{}", track.rate.numerator, track.rate.denominator)
+               : "unknown";
 }
 
 std::vector<ClipTrack> ReadClipTracks(IAAFFile* file) {

@@ -27,6 +27,9 @@ struct ClipTrack {
     }
 };
 
+// "30000/1001", or "unknown".
+std::string RateText(const ClipTrack& track);
+
 // The tracks of a described clip in the host's order: the picture, its alpha
 // where the clip shows one, the sounds. The description is where a host learns
 // them; the module's own count of tracks is the movie's, which is another.

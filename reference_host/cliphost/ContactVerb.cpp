@@ -112,7 +112,7 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
     options->parameters.AddTo(*verb);
     verb->callback([&session, &status, options] {
         Session running(session);
-        Essence essence(running, options->movie, options->parameters);
+        Essence essence = OpenEssence(running, options->movie, options->parameters);
         status = WriteSheet(essence, *options);
     });
 }

@@ -6,6 +6,7 @@
 
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -38,20 +39,55 @@ Essence::Essence(Session& session, std::filesystem::path movie, const ParameterO
         Fail("not opened", opened);
     }
     const Description description = DescribeContainer(session_, container.get(), movie_);
-    if (!description.file) {
-        throw Failure(kExitFile, description.problem);
-    }
-    tracks_ = ReadClipTracks(description.file.get());
+    undescribed_ = description.problem;
     // Before there is a mapping: it then makes no format of the former fields.
     parameters.ApplyTo(session_, movie_, *container);
-    const NCFRESULT mapped = container->GetSampleMapping(map_.Out());
-    if (mapped < 0) {
-        Fail("no sample map", mapped);
+    Map(*container);
+    tracks_ = description.file ? ReadClipTracks(description.file.get()) : FindTracks();
+}
+
+// The description says better what is wrong with a file, where it failed too.
+void Essence::Map(NMA::IMediaContainer3& container) {
+    const NCFRESULT mapped = container.GetSampleMapping(map_.Out());
+    const NCFRESULT provided = mapped < 0 ? mapped : Ask(map_.get(), provider_);
+    if (provided < 0 && !undescribed_.empty()) {
+        throw Failure(kExitFile, undescribed_);
     }
-    const NCFRESULT provided = Ask(map_.get(), provider_);
     if (provided < 0) {
-        Fail("no sample provider", provided);
+        Fail("no sample map", provided);
     }
+}
+
+// Without a description the tracks are known by which of the two providers
+// takes their numbers.
+std::vector<ClipTrack> Essence::FindTracks() {
+    std::vector<ClipTrack> tracks;
+    Ask(map_.get(), pictures_);
+    Ask(map_.get(), sounds_);
+    for (;;) {
+        ClipTrack track;
+        track.number = static_cast<ncfUInt32>(tracks.size());
+        ncfUInt32 count = 0;
+        std::vector<ImageFormat> formats;
+        if (pictures_ && ReadImageFormats(*pictures_, track.number, formats) >= 0) {
+            const bool isAlpha = !formats.empty() && formats[0].pixels == format::kMono;
+            track.kind = isAlpha ? TrackKind::Alpha : TrackKind::Picture;
+        } else if (sounds_ && sounds_->GetNumberOfAudioFormats(track.number, &count) >= 0) {
+            track.kind = TrackKind::Sound;
+            map_->GetNumberOfChannels(track.number, &track.channels);
+        } else {
+            break;
+        }
+        ncfUInt64 samples = 0;
+        map_->GetNumberOfSamples(track.number, &samples);
+        track.length = samples;
+        tracks.push_back(track);
+    }
+    session_.TakeNotices();
+    if (tracks.empty()) {
+        throw Failure(kExitFile, undescribed_);
+    }
+    return tracks;
 }
 
 NMA::IUncompressedImageProvider& Essence::pictures() {
@@ -141,6 +177,16 @@ void Essence::NeedDelivery(const ClipTrack& track) {
 
 void Essence::Fail(const std::string& what, NCFRESULT result) const {
     throw Failure(kExitFile, ProblemWith(session_, movie_, what.c_str(), result));
+}
+
+Essence OpenEssence(Session& session, const std::filesystem::path& movie,
+                    const ParameterOptions& parameters) {
+    Essence essence(session, movie, parameters);
+    if (!essence.undescribed().empty()) {
+        fmt::print(stderr, "cliphost: {}\n  what can be mapped is served all the same\n",
+                   essence.undescribed());
+    }
+    return essence;
 }
 
 }  // namespace cliphost

@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
 #include "reference_host/cliphost/ParameterOptions.h"
@@ -15,8 +16,10 @@
 namespace cliphost {
 
 // A movie opened for its samples: described first, as every host does, then
-// given its parameters, then mapped. Owns the mapping; the session must outlive
-// it.
+// given its parameters, then mapped. A movie that can be mapped but not
+// described, such as one whose end was cut off, has the tracks that the module
+// delivers; their rates are not known then. Owns the mapping; the session must
+// outlive it.
 class Essence {
 public:
     // Throws a Failure.
@@ -25,6 +28,8 @@ public:
     Session& session() const { return session_; }
     const std::filesystem::path& movie() const { return movie_; }
     const std::vector<ClipTrack>& tracks() const { return tracks_; }
+    // Why there is no description, empty when there is one.
+    const std::string& undescribed() const { return undescribed_; }
 
     NMA::ISampleMapping& map() const { return *map_; }
     NMA::ISampleProvider& provider() const { return *provider_; }
@@ -47,15 +52,23 @@ public:
     [[noreturn]] void Fail(const std::string& what, NCFRESULT result) const;
 
 private:
+    void Map(NMA::IMediaContainer3& container);
+    std::vector<ClipTrack> FindTracks();
     std::string TrackList() const;
 
     Session& session_;
     std::filesystem::path movie_;
     std::vector<ClipTrack> tracks_;
+    std::string undescribed_;
     host::Ref<NMA::ISampleMapping> map_;
     host::Ref<NMA::ISampleProvider> provider_;
     host::Ref<NMA::IUncompressedImageProvider> pictures_;
     host::Ref<NMA::IUncompressedAudioProvider> sounds_;
 };
+
+// The same for a verb: what keeps a movie from being described goes to standard
+// error.
+Essence OpenEssence(Session& session, const std::filesystem::path& movie,
+                    const ParameterOptions& parameters = {});
 
 }  // namespace cliphost

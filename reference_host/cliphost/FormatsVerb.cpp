@@ -96,7 +96,7 @@ Json FormatsOf(Essence& essence) {
         Json json = {{"track", track.number},
                      {"kind", NameOf(track.kind)},
                      {"length", track.length},
-                     {"rate", fmt::format("{}/{}", track.rate.numerator, track.rate.denominator)}};
+                     {"rate", RateText(track)}};
         const std::string obstacle = essence.Obstacle(track);
         if (!obstacle.empty()) {
             json["obstacle"] = obstacle;
@@ -151,7 +151,7 @@ void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
     parameters->AddTo(*verb);
     verb->callback([&session, movie, json, parameters] {
         Session running(session);
-        Essence essence(running, *movie, *parameters);
+        Essence essence = OpenEssence(running, *movie, *parameters);
         const Json list = FormatsOf(essence);
         if (*json) {
             fmt::print("{}\n", Json{{"movie", host::DisplayPath(*movie)}, {"tracks", list}}.dump(

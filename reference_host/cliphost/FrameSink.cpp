@@ -137,21 +137,19 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
 }
 
 std::string RawWords(const FrameReader& reader, const ClipTrack& track) {
+    const std::string rate = RateText(track);
     std::string words =
-        fmt::format("raw frames: {} x {}, {}, {} bytes a frame, {}/{} frames a second",
-                    reader.width(), reader.height(), WordsFor(reader.format()), reader.frameBytes(),
-                    track.rate.numerator, track.rate.denominator);
-    if (const char* const name = reader.layout().rawName) {
-        words += fmt::format(
-            "\nfor FFmpeg: -f rawvideo -pixel_format {} -video_size {}x{} "
-            "-framerate {}/{}",
-            name, reader.width(), reader.height(), track.rate.numerator, track.rate.denominator);
-    } else {
-        words +=
-            "\nFFmpeg has no name for this layout; take --format with another where one is "
-            "offered";
+        fmt::format("raw frames: {} x {}, {}, {} bytes a frame, {} frames a second", reader.width(),
+                    reader.height(), WordsFor(reader.format()), reader.frameBytes(), rate);
+    const char* const name = reader.layout().rawName;
+    if (!name) {
+        return words +
+               "\nFFmpeg has no name for this layout; take --format with another where "
+               "one is offered";
     }
-    return words;
+    words += fmt::format("\nfor FFmpeg: -f rawvideo -pixel_format {} -video_size {}x{}", name,
+                         reader.width(), reader.height());
+    return track.RateAsNumber() > 0.0 ? words + " -framerate " + rate : words;
 }
 
 }  // namespace cliphost

@@ -155,7 +155,7 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
             own.host.ignoreAlpha = false;
         }
         Session running(own);
-        Essence essence(running, options->movie, options->parameters);
+        Essence essence = OpenEssence(running, options->movie, options->parameters);
         status = FrameRun(essence, *options).Run();
     });
 }

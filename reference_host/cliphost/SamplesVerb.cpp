@@ -194,7 +194,7 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_flag("--json", options->json, "As JSON");
     verb->callback([&session, &status, options] {
         Session running(session);
-        Essence essence(running, options->movie);
+        Essence essence = OpenEssence(running, options->movie);
         status = SamplesRun(essence, *options).Run();
     });
 }

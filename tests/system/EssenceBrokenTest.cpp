@@ -1,0 +1,204 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// Movies whose media are damaged or cut: one bad frame is one failure, and what
+// is there is served.
+
+#include <algorithm>
+#include <fstream>
+
+#include "reference_host/cliphost/SampleMap.h"
+#include "reference_host/cliphost/SoundReader.h"
+#include "tests/system/EssenceSupport.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using cliphost::Essence;
+using cliphost::FrameReader;
+using cliphost::MappedSample;
+using cliphost::TrackKind;
+
+class EssenceBroken : public SystemTest {
+protected:
+    // A copy of a movie with the bytes of one stored picture overwritten.
+    std::filesystem::path Damaged(const char* name, std::uint64_t sample) {
+        const auto movie = MadeMovie(name);
+        const auto copy = folder() / (std::string("damaged_") + name);
+        std::filesystem::copy_file(movie, copy, std::filesystem::copy_options::overwrite_existing);
+        Essence essence(session(), movie);
+        MappedSample mapped;
+        EXPECT_EQ(cliphost::ReadMappedSample(essence.map(), 0, sample, mapped), NCF_OK);
+        std::fstream stream(copy, std::ios::binary | std::ios::in | std::ios::out);
+        stream.seekp(static_cast<std::streamoff>(mapped.position));
+        const std::string noise(static_cast<std::size_t>(mapped.size), '\x5A');
+        stream.write(noise.data(), static_cast<std::streamsize>(noise.size()));
+        EXPECT_TRUE(stream.good());
+        return copy;
+    }
+    // A movie whose header comes first, cut to a share of its bytes.
+    std::filesystem::path Cut(const std::filesystem::path& movie, double share) {
+        const auto copy = folder() / ("cut_" + movie.filename().string());
+        std::filesystem::copy_file(movie, copy, std::filesystem::copy_options::overwrite_existing);
+        const auto size = static_cast<double>(std::filesystem::file_size(movie));
+        std::filesystem::resize_file(copy, static_cast<std::uintmax_t>(size * share));
+        return copy;
+    }
+    std::filesystem::path HeaderFirst(const char* name) {
+        const auto movie = folder() / (std::string("first_") + name);
+        EXPECT_EQ(RunCommand("ffmpeg -nostdin -y -v error -i " + MadeMovie(name).string() +
+                             " -map 0 -c copy -movflags +faststart " + movie.string())
+                      .status,
+                  0);
+        return movie;
+    }
+};
+
+// Each picture of these stands alone, so only the damaged one may suffer.
+TEST_F(EssenceBroken, PictureFailsAndAllOthersAreServed) {
+    for (const char* const name : {"png.mov", "mjpeg.mov", "prores_with_pcm.mov"}) {
+        SCOPED_TRACE(name);
+        const auto damaged = Damaged(name, 1);
+        EssenceBytes whole;
+        {
+            Essence good(session(), MadeMovie(name));
+            whole = AllFrames(good, TrackKind::Picture, "");
+        }
+        Essence essence(session(), damaged);
+        FrameReader reader(essence, *essence.First(TrackKind::Picture), "");
+        const auto frameAt = [&](std::size_t frame) {
+            const auto size = static_cast<std::ptrdiff_t>(reader.frameBytes());
+            const auto start = whole.begin() + static_cast<std::ptrdiff_t>(frame) * size;
+            return EssenceBytes(start, start + size);
+        };
+        EXPECT_TRUE(OneFrame(reader, 0) == frameAt(0));
+        EXPECT_LT(reader.Read(1), 0);
+        EXPECT_NE(reader.Read(1), NMA_E_NODATA);
+        EXPECT_TRUE(OneFrame(reader, 2) == frameAt(2));
+        EXPECT_LT(reader.Read(1), 0) << "asked again";
+        EXPECT_TRUE(OneFrame(reader, 0) == frameAt(0));
+    }
+}
+
+TEST_F(EssenceBroken, PictureIsToldAndLeftOutByTheProgram) {
+    const auto damaged = Damaged("png.mov", 1);
+    const auto out = folder() / "frames";
+    const CommandResult result =
+        RunCliphost("frame " + damaged.string() + " --range 0: -o " + out.string());
+    EXPECT_EQ(result.status, 1);
+    EXPECT_NE(result.out.find("frame 1 is left out"), std::string::npos) << result.out;
+    EXPECT_TRUE(std::filesystem::exists(out / "damaged_png_000000.png"));
+    EXPECT_FALSE(std::filesystem::exists(out / "damaged_png_000001.png"));
+    EXPECT_TRUE(std::filesystem::exists(out / "damaged_png_000002.png"));
+    // Alone it leaves no file at all.
+    const auto single = folder() / "single.png";
+    EXPECT_EQ(RunCliphost("frame " + damaged.string() + " --frame 1 -o " + single.string()).status,
+              1);
+    EXPECT_FALSE(std::filesystem::exists(single));
+}
+
+TEST_F(EssenceBroken, LongGroupIsServedFromItsNextWholePicture) {
+    // Two groups of five; the first is damaged in its key picture.
+    const auto movie = folder() / "groups.mov";
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=320x180:r=25:d=0.4 -c:v "
+                         "libx264 -preset ultrafast -g 5 -x264-params scenecut=0 -bf 0 "
+                         "-pix_fmt yuv420p " +
+                         movie.string())
+                  .status,
+              0);
+    EssenceBytes whole;
+    MappedSample first;
+    {
+        Essence good(session(), movie);
+        whole = AllFrames(good, TrackKind::Picture, "");
+        ASSERT_EQ(cliphost::ReadMappedSample(good.map(), 0, 0, first), NCF_OK);
+    }
+    {
+        std::fstream stream(movie, std::ios::binary | std::ios::in | std::ios::out);
+        stream.seekp(static_cast<std::streamoff>(first.position));
+        stream << std::string(static_cast<std::size_t>(first.size), '\x5A');
+    }
+    Essence essence(session(), movie);
+    FrameReader reader(essence, *essence.First(TrackKind::Picture), "");
+    EXPECT_LT(reader.Read(0), 0);
+    for (std::size_t frame = 5; frame < 10; ++frame) {
+        const auto size = static_cast<std::ptrdiff_t>(reader.frameBytes());
+        const auto start = whole.begin() + static_cast<std::ptrdiff_t>(frame) * size;
+        EXPECT_TRUE(OneFrame(reader, frame) == EssenceBytes(start, start + size)) << frame;
+    }
+}
+
+TEST_F(EssenceBroken, CutFileServesWhatIsThere) {
+    const auto movie = HeaderFirst("mjpeg.mov");
+    EssenceBytes whole;
+    {
+        Essence good(session(), movie);
+        whole = AllFrames(good, TrackKind::Picture, "");
+    }
+    const auto cut = Cut(movie, 0.6);
+    Essence essence(session(), cut);
+    // Its bytes can't be hashed, so it has no description; its map is whole.
+    EXPECT_FALSE(essence.undescribed().empty());
+    ASSERT_EQ(essence.tracks().size(), 1u);
+    EXPECT_EQ(essence.tracks()[0].length, 4u);
+    FrameReader reader(essence, *essence.First(TrackKind::Picture), "");
+    const auto size = static_cast<std::ptrdiff_t>(reader.frameBytes());
+    int served = 0, refused = 0;
+    for (std::uint64_t frame = 0; frame < 4; ++frame) {
+        MappedSample mapped;
+        ASSERT_EQ(cliphost::ReadMappedSample(essence.map(), 0, frame, mapped), NCF_OK);
+        const bool isThere = mapped.position + mapped.size <= std::filesystem::file_size(cut);
+        const NCFRESULT result = reader.Read(frame);
+        if (isThere) {
+            const auto start = whole.begin() + static_cast<std::ptrdiff_t>(frame) * size;
+            EXPECT_EQ(result, NCF_OK) << frame;
+            EXPECT_TRUE(std::equal(reader.bytes(), reader.bytes() + size, start)) << frame;
+            ++served;
+        } else {
+            EXPECT_LT(result, 0) << frame;
+            ++refused;
+        }
+    }
+    EXPECT_GT(served, 0);
+    EXPECT_GT(refused, 0);
+}
+
+TEST_F(EssenceBroken, CutFileIsToldByTheSums) {
+    const auto cut = Cut(HeaderFirst("mjpeg.mov"), 0.6);
+    const CommandResult result = RunCliphost("samples " + cut.string());
+    EXPECT_EQ(result.status, 1);
+    EXPECT_NE(result.out.find("wrong: "), std::string::npos) << result.out;
+    EXPECT_NE(result.out.find("the file ends at"), std::string::npos) << result.out;
+}
+
+TEST_F(EssenceBroken, CutSoundIsServedToItsEndAndSilentFromThere) {
+    const auto movie = HeaderFirst("pcm_s16le.mov");
+    const auto cut = Cut(movie, 0.5);
+    const EssenceBytes whole = Decoded(movie, "-f s24le -c:a pcm_s24le");
+    Essence essence(session(), cut);
+    cliphost::SoundReader reader(essence, essence.tracks().at(0));
+    EXPECT_EQ(reader.Count(), 19200u);
+    const auto start = reader.Read(0, 4000);
+    EXPECT_FALSE(start.isSilence);
+    EXPECT_TRUE(std::equal(start.bytes, start.bytes + start.size, whole.begin()));
+    EXPECT_TRUE(reader.Read(15000, 1000).isSilence);
+    // The rest after the silence still works.
+    EXPECT_FALSE(reader.Read(100, 100).isSilence);
+}
+
+TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
+    const auto cut = Cut(HeaderFirst("pcm_s16le.mov"), 0.2);
+    const auto wav = folder() / "a.wav";
+    const CommandResult result =
+        RunCliphost("audio " + cut.string() + " --start 8000 -o " + wav.string());
+    EXPECT_EQ(result.status, 2) << result.out;
+    EXPECT_NE(result.out.find("give --rate"), std::string::npos) << result.out;
+    EXPECT_FALSE(std::filesystem::exists(wav));
+    const CommandResult told =
+        RunCliphost("audio " + cut.string() + " --start 8000 --rate 48000 -o " + wav.string());
+    EXPECT_EQ(told.status, 1);
+    EXPECT_NE(told.out.find("could not be read and are silence"), std::string::npos) << told.out;
+    EXPECT_EQ(Decoded(wav, "-f s24le -c:a pcm_s24le").size(), 11200u * 6);
+}
+
+}  // namespace

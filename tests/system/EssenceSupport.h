@@ -1,0 +1,49 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "reference_host/cliphost/Essence.h"
+#include "reference_host/cliphost/FrameReader.h"
+
+// What the essence tests compare with: FFmpeg's own commands over the same file.
+
+using EssenceBytes = std::vector<std::uint8_t>;
+
+// What a command prints, and how it ends; fails the test when it can't run.
+struct CommandResult {
+    int status = -1;
+    std::string out;  // both streams where asked for
+};
+CommandResult RunCommand(const std::string& command);
+// The program under test, with arguments; standard error is in `out` too.
+CommandResult RunCliphost(const std::string& arguments);
+
+// What ffmpeg gives for a movie with arguments between it and the output.
+EssenceBytes Decoded(const std::filesystem::path& movie, const std::string& arguments);
+
+// A packet of a stream as ffprobe reads it, without edit lists, in file order of
+// the stream, which is that of decoding.
+struct Packet {
+    std::uint64_t position = 0;
+    std::uint64_t size = 0;
+    std::int64_t time = 0;  // of presentation, in the stream's units
+    bool isKey = false;
+};
+std::vector<Packet> PacketsOf(const std::filesystem::path& movie, const std::string& stream);
+
+// All frames of a track, one behind the other; fails the test where one fails.
+EssenceBytes AllFrames(cliphost::Essence& essence, cliphost::TrackKind kind,
+                       const std::string& format);
+EssenceBytes OneFrame(cliphost::FrameReader& reader, std::uint64_t frame);
+
+// Signal to noise in decibels, infinite when equal, 0 when the sizes differ.
+double SignalToNoise(const EssenceBytes& a, const EssenceBytes& b);
+double SignalToNoise16(const std::vector<std::uint16_t>& a, const std::vector<std::uint16_t>& b);
+
+// Planes of 4:2:2 in 8 bits as Cb Y Cr Y.
+EssenceBytes Interleaved422(const EssenceBytes& planes, std::size_t width, std::size_t height);
