@@ -78,6 +78,12 @@ private:
     // The wrapper's question about the kind of a track.
     using TrackTest = ncfBool (QTWrapper::IQuickTimeWrapper::*)(ncfUInt32);
 
+    // The most tracks that are walked, and the highest number that is asked
+    // about: a wrapper that tells more is not believed, since each walk would
+    // cost as many questions.
+    static constexpr ncfUInt32 kMostTracks = 65535;
+
+    ncfUInt32 HighestTrack() const;
     ncfUInt32 CountTracks(TrackTest test) const;
     // Number of the `index`th track that passes the test; false past the end,
     // with `qtTrack` untouched.

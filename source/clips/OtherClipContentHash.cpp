@@ -19,12 +19,12 @@ NCFRESULT OtherClip::GetContentForHash(std::vector<ncfUInt8>& pContent) {
     pContent.clear();
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper;
     NCF_RETURN(GetQuickTimeInterface(qtWrapper));
-    const ncfUInt64 count = qtWrapper->GetDescribedTrackCount();
+    const ncfUInt32 count = qtWrapper->GetDescribedTrackCount();
     pContent.push_back(static_cast<ncfUInt8>(count));
-    for (ncfUInt64 i = 1; i <= count; ++i) {
+    for (ncfUInt32 i = 1; i <= std::min(count, kMostTracks); ++i) {
         // A track without a code counts as four zeros.
         ncfUInt8 fourcc[4] = {};
-        qtWrapper->GetFourCCFromImageDescrptor(static_cast<ncfUInt32>(i), fourcc);
+        qtWrapper->GetFourCCFromImageDescrptor(i, fourcc);
         pContent.insert(pContent.end(), fourcc, fourcc + sizeof fourcc);
     }
 

@@ -38,7 +38,7 @@ NCFRESULT OtherClip::SetMovieLengthImpl(const EditorSettings& editorSettings) {
 NCFRESULT OtherClip::SetEditRateAndLengthImpl(const EditorSettings& editorSettings) {
     NCF_FUNCTION("OtherClip::SetEditRateAndLengthImpl");
     CHK_PTR(qtWrapper_);
-    std::vector<ncfUInt64> trackLengthInFramesArray(qtWrapper_->GetNumberOfTracks());
+    std::vector<ncfUInt64> trackLengthInFramesArray(HighestTrack());
     const auto trackCount = static_cast<ncfUInt32>(trackLengthInFramesArray.size());
     const bool valid = editorSettings._areSettingsValid != 0;
     const double forcedRate =

@@ -4,6 +4,8 @@
 // Tracks by their number, and what the wrapper tells of timecode and sound.
 // Numbers may have gaps, so that each one up to the highest is asked about.
 
+#include <algorithm>
+
 #include "source/clips/OtherClip.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
@@ -12,25 +14,27 @@ using QTWrapper::IQuickTimeWrapper;
 
 // --- counting ------------------------------------------------------------------------
 
-// The highest number may be the largest that there is: the loop counts beyond
-// it.
+ncfUInt32 OtherClip::HighestTrack() const {
+    return std::min(qtWrapper_->GetNumberOfTracks(), kMostTracks);
+}
+
 ncfUInt32 OtherClip::CountTracks(TrackTest test) const {
     IQuickTimeWrapper& wrapper = *qtWrapper_.inArg();
-    const ncfUInt64 highest = wrapper.GetNumberOfTracks();
+    const ncfUInt32 highest = HighestTrack();
     ncfUInt32 count = 0;
-    for (ncfUInt64 number = 0; number <= highest; ++number) {
-        count += (wrapper.*test)(static_cast<ncfUInt32>(number)) ? 1 : 0;
+    for (ncfUInt32 number = 0; number <= highest; ++number) {
+        count += (wrapper.*test)(number) ? 1 : 0;
     }
     return count;
 }
 
 bool OtherClip::FindTrack(TrackTest test, ncfUInt32 index, ncfUInt32& qtTrack) const {
     IQuickTimeWrapper& wrapper = *qtWrapper_.inArg();
-    const ncfUInt64 highest = wrapper.GetNumberOfTracks();
-    ncfUInt64 passed = 0;
-    for (ncfUInt64 number = 0; number <= highest; ++number) {
-        if ((wrapper.*test)(static_cast<ncfUInt32>(number)) && passed++ == index) {
-            qtTrack = static_cast<ncfUInt32>(number);
+    const ncfUInt32 highest = HighestTrack();
+    ncfUInt32 passed = 0;
+    for (ncfUInt32 number = 0; number <= highest; ++number) {
+        if ((wrapper.*test)(number) && passed++ == index) {
+            qtTrack = number;
             return true;
         }
     }

@@ -185,6 +185,21 @@ TEST_F(LoadMediaTest, NeverTriesTheWrapperOnAFileThatCannotBeOpened) {
     EXPECT_EQ(host->creations(QTWrapper::CompID_QuickTimeWrapper), 0);
 }
 
+TEST_F(LoadMediaTest, LetsTheSecondRouteThrowToo) {
+    parser->script = {{NCF_E_FAIL, 0, 0}};
+    host->maker(QTWrapper::CompID_QuickTimeWrapper,
+                [](const GUID&, void**) -> NCFRESULT { throw NCF_E_ABORT; });
+    try {
+        Ask(file.path());
+        FAIL() << "nothing was thrown";
+    } catch (NCFRESULT result) {
+        EXPECT_EQ(result, NCF_E_ABORT);
+    }
+    ASSERT_TRUE(media);
+    EXPECT_NE(dynamic_cast<QuickTimeClip*>(media.get()), nullptr) << "the clip that failed last";
+    EXPECT_FALSE(media->IsLoaded());
+}
+
 TEST_F(LoadMediaTest, LetsAFileThatCannotBeOpenedThrow) {
     RecordingNMALog lines(1);
     try {

@@ -86,6 +86,17 @@ TEST_F(OtherClipContentHash, CountsTracksInOneByte) {
     EXPECT_EQ(wrapper->lastTrack, 257u);
 }
 
+TEST_F(OtherClipContentHash, TakesNoMoreCodesThanAMovieCanHaveTracks) {
+    wrapper->AddSound(1);
+    for (const ncfUInt32 told : {65536u, 0xFFFFFFFFu}) {
+        wrapper->describedTracks = told;
+        const std::vector<ncfUInt8> content = ContentOf({42});
+        ASSERT_EQ(content.size(), 1 + 65535 * 4 + 8u) << told;
+        EXPECT_EQ(content.front(), static_cast<ncfUInt8>(told)) << "the number as it is told";
+        EXPECT_EQ(wrapper->lastTrack, 65535u);
+    }
+}
+
 TEST_F(OtherClipContentHash, OpensTheMovieOnce) {
     wrapper->AddSound(1);
     LoadOther();

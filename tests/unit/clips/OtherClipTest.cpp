@@ -105,6 +105,8 @@ TEST_F(LoadOtherClip, ChecksWhatItWasGiven) {
     other.reset(new OtherClip(HostText(file.path()), nullptr, factory));
     EXPECT_EQ(LastRecord(), "CHK_PTR(console_)OtherClip::LoadClipImpl");
     EXPECT_EQ(other->LoadClipImpl(), NCF_E_POINTER);
+    EXPECT_EQ(other->SetFieldLayoutDetails(), NCF_E_POINTER);
+    EXPECT_EQ(LastRecord(), "CHK_PTR(console_)OtherClip::SetFieldLayoutDetails");
     other.reset(new OtherClip(nullptr, console, factory));
     EXPECT_EQ(LastRecord(), "CHK_PTR(fileName_)OtherClip::LoadClipImpl");
     EXPECT_EQ(other->LoadClipImpl(), NCF_E_POINTER);

@@ -97,6 +97,15 @@ TEST_F(OtherClipTiming, GivesNoRoomForNoTracks) {
     EXPECT_TRUE(wrapper->trackLengths.empty());
 }
 
+TEST_F(OtherClipTiming, GivesRoomForNoMoreTracksThanAMovieCanHave) {
+    for (const ncfUInt32 highest : {65536u, 0xFFFFFFFFu}) {
+        LoadUsual();
+        wrapper->highestTrack = highest;
+        EXPECT_EQ(other->SetEditRate(Settings()), NCF_OK);
+        ASSERT_EQ(wrapper->trackLengths.size(), 65535u) << highest;
+    }
+}
+
 TEST_F(OtherClipTiming, RefusesALengthOfZero) {
     LoadUsual();
     wrapper->length = 0;

@@ -50,6 +50,32 @@ TEST_F(OtherClipTracks, CountsTracksByTheHighestNumber) {
     EXPECT_EQ(other->GetTrackCount(nullptr), NCF_E_NOTFOUND) << "tracks are looked for first";
 }
 
+// Each walk up to such a number would take for ever.
+TEST_F(OtherClipTracks, AsksAboutNoNumberAboveSixteenBits) {
+    wrapper->AddSound(65535);
+    wrapper->AddSound(65536);
+    for (const ncfUInt32 highest : {65536u, 1000000u, 0xFFFFFFFFu}) {
+        wrapper->highestTrack = highest;
+        wrapper->testedTracks.clear();
+        EXPECT_EQ(other->GetAudioTrackCount(&number), NCF_OK);
+        ASSERT_EQ(number, 4u) << highest;
+        ASSERT_EQ(wrapper->testedTracks.size(), 65536u) << highest;
+        EXPECT_EQ(wrapper->testedTracks.back(), 65535u);
+        EXPECT_EQ(other->GetVideoTrackCount(&number), NCF_OK);
+        EXPECT_EQ(number, 2u);
+        EXPECT_EQ(other->GetTimeCodeTrackCount(&number), NCF_OK);
+        EXPECT_EQ(number, 1u);
+        EXPECT_EQ(other->GetAudioTrackQTId(3, number), NCF_OK);
+        EXPECT_EQ(number, 65535u);
+        EXPECT_EQ(other->GetAudioTrackQTId(4, number), NCF_E_NOTFOUND);
+        EXPECT_EQ(other->GetVideoTrackQTId(2, number), NCF_E_NOTFOUND);
+        EXPECT_EQ(other->GetTimecodeTrackQTId(1, number), NCF_E_INVALIDARG);
+        EXPECT_EQ(other->GetTrackCount(&number), NCF_OK);
+        EXPECT_EQ(number, highest) << "told as it is";
+        EXPECT_EQ(other->GetTrackType(highest, &number), NCF_OK);
+    }
+}
+
 TEST_F(OtherClipTracks, ChecksTheOutputsOfCounts) {
     EXPECT_EQ(other->GetVideoTrackCount(nullptr), NCF_E_POINTER);
     EXPECT_EQ(LastRecord(), "CHK_PTR(trackCount)OtherClip::GetVideoTrackCountImpl");
