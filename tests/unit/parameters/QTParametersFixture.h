@@ -122,7 +122,6 @@ protected:
     FakeValueFactory* factory;
     NCFSmartPtr<INCFString> xml;
     NCFSmartPtr<INCFParametersXML> parameters;
-    NCFSmartPtr<INCFLock> parting;  // a mapping's lock that outlives it
 
 private:
     void Take(void* out) { parameters.attach(static_cast<INCFParametersXML*>(out)); }

@@ -123,13 +123,21 @@ TEST_F(QTParametersObject, ForgetsAFormerClipWhenTheNextMappingHasNone) {
 
 TEST_F(QTParametersObject, KeepsItsMappingAlive) {
     Attach();
-    EXPECT_EQ(interface->Release(), 1u) << "the parameters' is left";
-    interface = nullptr;
+    void* other = nullptr;
+    FakeLock* const ours = lock;
+    ASSERT_EQ(
+        CreateInstanceOf<OpenMapping>(host->unknown(), nullptr, NMA::IID_ISampleMapping, &other),
+        NCF_OK);
+    auto* const second = static_cast<NMA::ISampleMapping*>(other);
+    ASSERT_EQ(object().AttachToQTSampleProvider(dynamic_cast<OpenMapping&>(*second)), NCF_E_FAIL);
+    ASSERT_EQ(dynamic_cast<OpenMapping&>(*second).SetMediaContainer(clip), NCF_OK);
+    ASSERT_EQ(object().AttachToQTSampleProvider(dynamic_cast<OpenMapping&>(*second)), NCF_OK);
+    EXPECT_EQ(second->Release(), 1u) << "the parameters' is left";
+    EXPECT_EQ(GetObjectCount(), 3u);
     EXPECT_EQ(parameters->GetDefaultValuesXML(xml.inArg()), NCF_OK);
-    EXPECT_EQ(lock->AddRef(), 2u);
     parameters = nullptr;
-    EXPECT_EQ(lock->references(), 1u) << "the mapping went with them";
-    parting.attach(lock);
+    EXPECT_EQ(GetObjectCount(), 1u) << "the mapping went with them";
+    lock = ours;
 }
 
 TEST_F(QTParametersObject, LeavesTheClipAsItIs) {
