@@ -16,7 +16,8 @@ make_movies() { # make_movies FOLDER
     shift
     [ -s "$folder/$name" ] || ffmpeg -nostdin -y -loglevel error "$@" -metadata creation_time=2026-01-31T12:00:00Z "$folder/$name"
   }
-  local hd='testsrc2=size=1920x1080:rate=25:duration=2'
+  # High definition is Rec. 709, and says so.
+  local hd='testsrc2=size=1920x1080:rate=25:duration=2,scale=out_color_matrix=bt709:out_range=tv,setparams=colorspace=bt709:color_primaries=bt709:color_trc=bt709'
   local ntsc='testsrc2=size=720x486:rate=30000/1001:duration=2'
   local tone='sine=frequency=440:sample_rate=48000:duration=2'
   make prores_hq_1080p25.mov -f lavfi -i "$hd" -f lavfi -i "$tone" -c:v prores_ks -profile:v hq \
@@ -65,6 +66,59 @@ echo
 echo '== describe'
 "$cliphost" describe "$@" --use-alpha --out-dir "$out/aaf" || status=$?
 
+# --- what the movies look and sound like ----------------------------------------
+pictures=$out/pictures
+sounds=$out/sounds
+mkdir -p "$pictures" "$sounds"
+
+# The endings of all kinds of files that the module claims, as find's tests.
+endings=(-false)
+while read -r _ ending _; do
+  endings+=(-o -iname "*.$ending")
+done < <("$cliphost" types)
+
+movies_of() { # movies_of PATH: the movies that it names
+  if [ -d "$1" ]; then
+    find "$1" -maxdepth 1 -type f \( "${endings[@]}" \) | sort
+  else
+    printf '%s\n' "$1"
+  fi
+}
+
+kinds_of() { # kinds_of MOVIE: picture, alpha and sound tracks as lines "number kind"
+  "$cliphost" formats "$1" --use-alpha 2>/dev/null | sed -n 's/^track \([0-9]*\): \([a-z]*\),.*/\1 \2/p'
+}
+
+show() { # show MOVIE: a sheet, the deepest picture there is, its alpha, each sound
+  local movie=$1 name number kind
+  name=$(basename "$movie")
+  while read -r number kind; do
+    case $kind in
+      picture)
+        "$cliphost" contact "$movie" -o "$pictures/${name}_sheet.png" || status=$?
+        "$cliphost" frame "$movie" --format deepest -o "$pictures/$name.png" || status=$?
+        ;;
+      alpha)
+        "$cliphost" frame "$movie" --use-alpha --track "$number" --format deepest \
+          -o "$pictures/${name}_alpha.png" || status=$?
+        ;;
+      sound)
+        "$cliphost" audio "$movie" --use-alpha --track "$number" \
+          -o "$sounds/${name}_$number.wav" || status=$?
+        ;;
+    esac
+  done < <(kinds_of "$movie")
+}
+
+echo
+echo '== pictures and sound'
+for path in "$@"; do
+  while read -r movie; do
+    show "$movie"
+  done < <(movies_of "$path")
+done
+
 echo
 echo "AAF files are in $out/aaf; any program that reads AAF opens them."
+echo "Contact sheets, pictures and alpha are in $pictures, the sounds in $sounds."
 exit $status

@@ -94,8 +94,8 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
         return kExitFine;
     }
     if (!OutputFile::IsStandardOutput(options.output)) {
-        fmt::print("{}: {} samples of {} channels, 24 bits at {} Hz\n", DisplayPath(options.output),
-                   count, form.channels, form.rate);
+        fmt::print("{}: {} samples, {} channel{}, 24 bits at {} Hz\n", DisplayPath(options.output),
+                   count, form.channels, form.channels == 1 ? "" : "s", form.rate);
     }
     if (silent > 0) {
         fmt::print(stderr, "cliphost: {}: {} of {} samples could not be read and are silence\n",

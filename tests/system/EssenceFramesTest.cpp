@@ -39,6 +39,26 @@ TEST_F(EssenceFrames, OfEightBits422AreTheDecodersBytes) {
     }
 }
 
+// D-10 codes the lines of the vertical interval above the picture; they are not
+// of the picture that the movie tells of.
+TEST_F(EssenceFrames, OfD10LeaveTheVerticalIntervalOut) {
+    struct Interval {
+        const char* name;
+        const char* crop;
+    };
+    for (const Interval& movie : {Interval{"imx50_pal.mov", "crop=720:576:0:32"},
+                                  Interval{"imx50_ntsc.mov", "crop=720:486:0:26"}}) {
+        SCOPED_TRACE(movie.name);
+        Essence essence(session(), MadeMovie(movie.name));
+        const EssenceBytes got = AllFrames(essence, TrackKind::Picture, "2vuy");
+        const EssenceBytes wanted =
+            Decoded(MadeMovie(movie.name), std::string("-vf ") + movie.crop +
+                                               " -f rawvideo -pix_fmt uyvy422 -vsync passthrough");
+        ASSERT_FALSE(got.empty());
+        EXPECT_TRUE(got == wanted) << SignalToNoise(got, wanted) << " dB";
+    }
+}
+
 struct Sized {
     const char* name;
     std::size_t width;

@@ -171,6 +171,36 @@ FrameOwner Reformed(const AVFrame& frame, AVPixelFormat format, int width, int h
     return out;
 }
 
+// Pictures that begin with the lines of the vertical interval, as those of D-10
+// do: their files tell the size of what is behind.
+struct IntervalForm {
+    int codedHeight;
+    int height;
+};
+constexpr IntervalForm kIntervalForms[] = {{608, 576}, {512, 486}};
+
+// The picture without its vertical interval; null for one that has none.
+FrameOwner WithoutInterval(const AVFrame& frame, int width, int height) {
+    for (const IntervalForm& form : kIntervalForms) {
+        if (frame.width != width || width != 720 || frame.height != form.codedHeight ||
+            height != form.height || frame.format != AV_PIX_FMT_YUV422P) {
+            continue;
+        }
+        FrameOwner out(av_frame_clone(&frame));
+        if (!out) {
+            return nullptr;
+        }
+        // An even number of lines, so each field keeps its own.
+        for (int plane = 0; plane < 3; ++plane) {
+            out->data[plane] +=
+                std::ptrdiff_t{form.codedHeight - form.height} * out->linesize[plane];
+        }
+        out->height = form.height;
+        return out;
+    }
+    return nullptr;
+}
+
 }  // namespace
 
 bool WritePicture(const AVFrame& frame, PixelLayout layout, ncfUInt32 width, ncfUInt32 height,
@@ -179,6 +209,9 @@ bool WritePicture(const AVFrame& frame, PixelLayout layout, ncfUInt32 width, ncf
     const AVPixelFormat readable = ReadableFormat(stored);
     const int wantedWidth = static_cast<int>(width);
     const int wantedHeight = static_cast<int>(height);
+    if (const FrameOwner behind = WithoutInterval(frame, wantedWidth, wantedHeight)) {
+        return WritePicture(*behind, layout, width, height, to);
+    }
     if (readable != stored || frame.width != wantedWidth || frame.height != wantedHeight) {
         // A palette can't be scaled; everything else keeps its format.
         const AVPixelFormat format = readable == AV_PIX_FMT_PAL8 ? AV_PIX_FMT_BGRA : readable;
