@@ -167,6 +167,8 @@ public:
         return giveObject("GetSampleTable", out, table);
     }
     NCFRESULT QueryVideoDescBufferDetails(ncfUInt32* flag, ncfUInt32* bits) override {
+        *flag = 1;  // not to be believed when the answer is a failure
+        *bits = 9;
         give("QueryVideoDescBufferDetails", flag, interlaced);
         return result("QueryVideoDescBufferDetails", bits, fieldBits);
     }

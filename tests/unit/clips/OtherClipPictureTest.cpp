@@ -124,6 +124,19 @@ TEST_F(OtherClipPicture, TakesSizeAndRatioInOneAnswerAndSetsTheMovieBack) {
     EXPECT_TRUE(journal.lines().empty()) << "known since the load";
 }
 
+TEST_F(OtherClipPicture, SetsTheMovieBackInSixteenBits) {
+    wrapper->width = 40000;
+    wrapper->height = 0x18000;
+    LoadUsual();
+    EXPECT_TRUE(other->IsLoaded());
+    EXPECT_EQ(wrapper->boxArguments, "0 0 -32768 -25536");
+    ncfUInt32 a = 0;
+    ncfUInt32 b = 0;
+    EXPECT_EQ(other->GetEncodedWidthAndHeight(&a, &b), NCF_OK);
+    EXPECT_EQ(a, 40000u);
+    EXPECT_EQ(b, 0x18000u);
+}
+
 TEST_F(OtherClipPicture, ReadsTheRatioAgainWithoutSettingTheMovieBack) {
     wrapper->aspectNum = 0;
     LoadUsual();
@@ -325,6 +338,7 @@ TEST_F(OtherClipPicture, TakesColourFromTheTwoFlags) {
 }
 
 TEST_F(OtherClipPicture, HandsFailuresAboutColourOn) {
+    wrapper->found709 = 1;
     LoadUsual();
     wrapper->results["GetCodecColorSpaceInfo"] = NCF_E_ABORT;
     EXPECT_EQ(other->SetColorSpaceImpl(), NCF_E_ABORT);
@@ -335,5 +349,5 @@ TEST_F(OtherClipPicture, HandsFailuresAboutColourOn) {
                      "OtherClip::SetColorSpaceImpl"));
     ncfUInt32 colorSpace = 0;
     EXPECT_EQ(other->GetColorSpace(&colorSpace), NCF_OK);
-    EXPECT_EQ(colorSpace, 2u);
+    EXPECT_EQ(colorSpace, 2u) << "the start of each look";
 }

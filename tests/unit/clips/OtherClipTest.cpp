@@ -42,6 +42,8 @@ TEST_F(LoadOtherClip, LoadsSoundAloneWithoutAskingForAPicture) {
     ncfUInt32 colorSpace = 5;
     EXPECT_EQ(other->GetColorSpace(&colorSpace), NMA_E_NOTSET);
     EXPECT_TRUE(host->console().lines().empty());
+    EXPECT_TRUE(wrapper->testedTracks.empty());
+    EXPECT_TRUE(log->records().empty()) << "nothing of a picture was missed";
 }
 
 TEST_F(LoadOtherClip, RefusesAMovieWithoutTracks) {

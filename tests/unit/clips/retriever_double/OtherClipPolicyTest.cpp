@@ -86,6 +86,22 @@ TEST_F(OtherClipPolicy, ProvidesPicturesOfAnotherLengthThanTheMovie) {
     EXPECT_EQ(journal.count("wrapper.GetFirstVideoTrack"), 0);
 }
 
+// The first reason that applies is the one that is told.
+TEST_F(OtherClipPolicy, LooksAtLengthThenAlphaThenDescriptions) {
+    wrapper->alphaByContainer = 1;
+    wrapper->descriptionCount = 2;
+    wrapper->pictureIssue = 1;
+    LoadOther();
+    Forget();
+    EXPECT_EQ(other->IsVideoSampleProviderMedia(&info), 0);
+    ExpectRefusal("MovieTrackDurationIssues found.", "MovieTrackDurationIssues found.\n");
+    wrapper->pictureIssue = 0;
+    Forget();
+    EXPECT_EQ(other->IsVideoSampleProviderMedia(&info), 0);
+    ExpectRefusal("The movie contains alpha.", "The movie contains alpha.\n");
+    EXPECT_EQ(journal.count("wrapper.GetFirstVideoTrack"), 0);
+}
+
 TEST_F(OtherClipPolicy, TakesNoOffenceAtTheLengthOfTheSound) {
     wrapper->soundIssue = 1;
     EXPECT_EQ(other->IsVideoSampleProviderMedia(&info), 1);
