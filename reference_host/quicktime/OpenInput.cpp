@@ -7,6 +7,7 @@ extern "C" {
 #include <libavutil/dict.h>
 }
 
+#include <cerrno>
 #include <cstdio>
 #include <fstream>
 #include <string_view>
@@ -18,26 +19,35 @@ constexpr int kBufferBytes = 32768;
 
 char detailsMark;
 
-// The one file that an input reads. The library has a buffer of its own.
+// The one file that an input reads. The library has a buffer of its own, and
+// lets no exception through.
 int ReadBytes(void* file, std::uint8_t* to, int size) {
-    const auto got = static_cast<std::filebuf*>(file)->sgetn(reinterpret_cast<char*>(to), size);
-    return got > 0 ? static_cast<int>(got) : AVERROR_EOF;
+    try {
+        const auto got = static_cast<std::filebuf*>(file)->sgetn(reinterpret_cast<char*>(to), size);
+        return got > 0 ? static_cast<int>(got) : AVERROR_EOF;
+    } catch (...) {
+        return AVERROR(EIO);  // the file can't be read there
+    }
 }
 
 int64_t SeekBytes(void* file, int64_t offset, int whence) {
-    auto& bytes = *static_cast<std::filebuf*>(file);
-    if ((whence & AVSEEK_SIZE) != 0) {
-        const auto here = bytes.pubseekoff(0, std::ios::cur, std::ios::in);
-        const auto end = bytes.pubseekoff(0, std::ios::end, std::ios::in);
-        bytes.pubseekpos(here, std::ios::in);
-        return end;
+    try {
+        auto& bytes = *static_cast<std::filebuf*>(file);
+        if ((whence & AVSEEK_SIZE) != 0) {
+            const auto here = bytes.pubseekoff(0, std::ios::cur, std::ios::in);
+            const auto end = bytes.pubseekoff(0, std::ios::end, std::ios::in);
+            bytes.pubseekpos(here, std::ios::in);
+            return end;
+        }
+        const auto from = whence & ~AVSEEK_FORCE;
+        return bytes.pubseekoff(offset,
+                                from == SEEK_SET   ? std::ios::beg
+                                : from == SEEK_CUR ? std::ios::cur
+                                                   : std::ios::end,
+                                std::ios::in);
+    } catch (...) {
+        return AVERROR(EIO);
     }
-    const auto from = whence & ~AVSEEK_FORCE;
-    return bytes.pubseekoff(offset,
-                            from == SEEK_SET   ? std::ios::beg
-                            : from == SEEK_CUR ? std::ios::cur
-                                               : std::ios::end,
-                            std::ios::in);
 }
 
 void CloseBytes(AVIOContext* bytes) {
