@@ -3,6 +3,8 @@
 
 #include "source/clips/HashContent.h"
 
+#include <algorithm>
+
 #include "source/plugin/ResultChecks.h"
 #include "source/plugin/os/Os.h"
 
@@ -40,7 +42,11 @@ NCFRESULT AppendFileRange(const char* function, const char* statement,
     }
     const auto wanted = static_cast<ncfUInt32>(size);
     Kept kept{content, content.size()};
-    content.reserve(kept.size + wanted);
+    // The first range gets its room exactly; from then on it doubles, since a
+    // movie of many tracks must not move everything for each of them.
+    if (const std::size_t needed = kept.size + wanted; needed > content.capacity()) {
+        content.reserve(std::max(needed, 2 * content.capacity()));
+    }
     os::ExpectLargeBlock(content.data() + kept.size, wanted);
     content.resize(kept.size + wanted);
     const NCFRESULT result =
