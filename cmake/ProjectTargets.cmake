@@ -33,26 +33,10 @@ if(CLIPHOST_FUZZ)
   target_compile_options(project_options INTERFACE -fsanitize=fuzzer-no-link)
 endif()
 
-# While rooms grow beside each other: a source that is not there yet is left out.
-macro(project_present list)
-  set(present "")
-  foreach(file ${${list}})
-    if(IS_ABSOLUTE ${file} OR EXISTS ${CMAKE_CURRENT_SOURCE_DIR}/${file})
-      list(APPEND present ${file})
-    endif()
-  endforeach()
-  if(NOT present)
-    file(WRITE ${CMAKE_CURRENT_BINARY_DIR}/empty.cpp "")
-    set(present ${CMAKE_CURRENT_BINARY_DIR}/empty.cpp)
-  endif()
-  set(${list} ${present})
-endmacro()
-
 # project_library(NAME SOURCES file... [PUBLIC target...] [PRIVATE target...])
 # One static library for one folder, linked into the module, the host or tests.
 function(project_library name)
   cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
-  project_present(ARG_SOURCES)
   add_library(${name} STATIC ${ARG_SOURCES})
   target_link_libraries(${name} PUBLIC project_options host_interfaces ${ARG_PUBLIC}
                                 PRIVATE ${ARG_PRIVATE})
@@ -62,7 +46,6 @@ endfunction()
 # A GoogleTest program; each of its tests is one of ctest's.
 function(project_test name)
   cmake_parse_arguments(ARG "" "" "SOURCES;LIBS;LABELS" ${ARGN})
-  project_present(ARG_SOURCES)
   add_executable(${name} ${ARG_SOURCES})
   target_link_libraries(${name} PRIVATE project_options ${ARG_LIBS} GTest::gtest GTest::gmock
                                         GTest::gtest_main)
