@@ -227,7 +227,6 @@ TEST(Ids, AreThoseOfTheirInterfaces) {
     EXPECT_EQ(IdOf<INCFParametersXML>(), "45FFBAE6-E8F4-48E9-A4A9-1C85BD8D063A");
 }
 
-
 // The factory of numbers goes by the type of what it makes.
 TEST(Ids, OfTheFactoryOfNumbersIsTheirType) {
     EXPECT_EQ(TextOf(kValueTypeUInt32), "4EB1A950-7103-11D6-A663-0030658A6504");
