@@ -62,19 +62,14 @@ for path in "$@"; do
   fi
 done
 
-echo
-echo '== describe'
-"$cliphost" describe "$@" --use-alpha --out-dir "$out/aaf" || status=$?
-
-# --- what the movies look and sound like ----------------------------------------
-pictures=$out/pictures
-sounds=$out/sounds
-mkdir -p "$pictures" "$sounds"
-
-# The endings of all kinds of files that the module claims, as find's tests.
+# The endings of all kinds of files that the module claims, as find's tests; of
+# texts and MIDI files there is nothing to show.
 endings=(-false)
 while read -r _ ending _; do
-  endings+=(-o -iname "*.$ending")
+  case $ending in
+    TXT | MID) ;;
+    *) endings+=(-o -iname "*.$ending") ;;
+  esac
 done < <("$cliphost" types)
 
 movies_of() { # movies_of PATH: the movies that it names
@@ -84,6 +79,25 @@ movies_of() { # movies_of PATH: the movies that it names
     printf '%s\n' "$1"
   fi
 }
+
+# A folder goes through the module's list, which names its .mov files; files of
+# other kinds are opened one by one.
+others=()
+for path in "$@"; do
+  if [ -d "$path" ]; then
+    while read -r file; do others+=("$file"); done \
+      < <(movies_of "$path" | grep -iv '\.mov$')
+  fi
+done
+
+echo
+echo '== describe'
+"$cliphost" describe "$@" "${others[@]}" --use-alpha --out-dir "$out/aaf" || status=$?
+
+# --- what the movies look and sound like ----------------------------------------
+pictures=$out/pictures
+sounds=$out/sounds
+mkdir -p "$pictures" "$sounds"
 
 kinds_of() { # kinds_of MOVIE: picture, alpha and sound tracks as lines "number kind"
   "$cliphost" formats "$1" --use-alpha 2>/dev/null | sed -n 's/^track \([0-9]*\): \([a-z]*\),.*/\1 \2/p'
