@@ -5,6 +5,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <cmath>
 #include <cstdio>
 
@@ -221,8 +222,11 @@ std::string Joined(const std::vector<std::string>& texts) {
 
 MediaVerdict CheckMedia(cliphost::Session& session, const std::filesystem::path& file,
                         const std::filesystem::path& saveAs) {
-    const ProbedFile probed = ProbeFile(file);
+    ProbedFile probed = ProbeFile(file);
     const auto defects = DefectsOf(file, probed, kEditorRate);
+    if (std::find(defects.begin(), defects.end(), "fragmented") != defects.end()) {
+        MeasurePackets(file, probed);
+    }
     const cliphost::Description description = cliphost::DescribeMovie(session, file);
     MediaVerdict verdict;
     if (!description.file) {

@@ -3,10 +3,12 @@
 
 #include "tests/system/media/Probe.h"
 
+#include <algorithm>
 #include <cstdio>
 #include <cstdlib>
 #include <memory>
 #include <nlohmann/json.hpp>
+#include <sstream>
 
 namespace {
 
@@ -88,4 +90,34 @@ ProbedFile ProbeFile(const std::filesystem::path& file) {
         probed.streams.push_back(StreamOf(stream));
     }
     return probed;
+}
+
+void MeasurePackets(const std::filesystem::path& file, ProbedFile& probed) {
+    std::istringstream lines(
+        OutputOf("ffprobe -v quiet -of csv=p=0 -show_entries packet=stream_index,duration_time " +
+                 Quoted(std::filesystem::absolute(file).string())));
+    struct Sum {
+        double packets = 0;
+        double timed = 0;  // packets whose duration is told
+        double seconds = 0;
+    };
+    std::vector<Sum> sums(probed.streams.size());
+    for (std::string line; std::getline(lines, line);) {
+        std::size_t stream = 0;
+        double seconds = 0;
+        const int read = std::sscanf(line.c_str(), "%zu,%lf", &stream, &seconds);
+        if (read < 1 || stream >= sums.size()) {
+            continue;
+        }
+        ++sums[stream].packets;
+        sums[stream].timed += read == 2;
+        sums[stream].seconds += read == 2 ? seconds : 0;
+    }
+    probed.duration = 0;
+    for (std::size_t i = 0; i < sums.size(); ++i) {
+        if (sums[i].timed > 0) {
+            probed.streams[i].duration = sums[i].seconds / sums[i].timed * sums[i].packets;
+            probed.duration = std::max(probed.duration, probed.streams[i].duration);
+        }
+    }
 }

@@ -35,3 +35,7 @@ struct ProbedFile {
 };
 
 ProbedFile ProbeFile(const std::filesystem::path& file);
+
+// Takes the lengths of the streams from their packets: what the header of a
+// fragmented file says of them may be anything.
+void MeasurePackets(const std::filesystem::path& file, ProbedFile& probed);
