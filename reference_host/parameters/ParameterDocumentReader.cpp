@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <cstring>
@@ -8,6 +9,7 @@
 #include "reference_host/parameters/GuidText.h"
 #include "reference_host/parameters/ParameterDocument.h"
 #include "reference_host/parameters/ParameterNames.h"
+#include "reference_host/util/text/Encodings.h"
 #include "reference_host/xml/EventReader.h"
 #include "reference_host/xml/XmlTree.h"
 
@@ -40,13 +42,19 @@ std::string PlaceOf(const pugi::xml_node& node) {
     throw Refusal{result, PlaceOf(node) + ": " + what};
 }
 
-// A foreign text for a message: short, on one line.
+// A foreign text for a message: short, on one line, and nothing in it that a
+// terminal would take for a command.
 std::string Shown(std::string_view text) {
-    std::string shown = "\"";
-    for (const char c : text.substr(0, 60)) {
-        shown += static_cast<unsigned char>(c) < 0x20 ? ' ' : c;
+    constexpr std::size_t kMost = 60;
+    std::u32string characters = text::FromUtf8(text.substr(0, 4 * kMost));
+    const bool isCut = characters.size() > kMost || text.size() > 4 * kMost;
+    characters.resize(std::min(characters.size(), kMost));
+    for (char32_t& c : characters) {
+        if (c < 0x20 || (c >= 0x7F && c < 0xA0)) {
+            c = U' ';
+        }
     }
-    return shown + (text.size() > 60 ? "...\"" : "\"");
+    return "\"" + text::ToUtf8Lossy(characters) + (isCut ? "...\"" : "\"");
 }
 
 std::string_view Trimmed(std::string_view text) {

@@ -162,6 +162,30 @@ TEST(ParameterDocumentHostile, IdsThatAreNoneAreRefused) {
                   NCF_E_INVALIDARG, "\"a b\"");
 }
 
+TEST(ParameterDocumentHostile, CommandsToATerminalAreNotRepeated) {
+    const std::string id = "id='0E74B673-0CA8-403B-A142-986D79508637'";
+    ExpectRefusal(With(id,
+                       "id='a\xC2\x9B"
+                       "31m\x7F"
+                       "b'"),
+                  NCF_E_INVALIDARG, "\"a 31m b\"");
+    ExpectRefusal(With(id, "id='&#x9B;2J&#9;\xC2\xA0'"), NCF_E_INVALIDARG, "\" 2J \xC2\xA0\"");
+    // Long ones end between characters.
+    const std::string euro = "\xE2\x82\xAC";
+    ExpectRefusal(With(id, "id='" + Repeated(euro, 60) + "'"), NCF_E_INVALIDARG,
+                  "\"" + Repeated(euro, 60) + "\"");
+    ExpectRefusal(With(id, "id='" + Repeated(euro, 61) + "'"), NCF_E_INVALIDARG,
+                  "\"" + Repeated(euro, 60) + "...\"");
+    ExpectRefusal(With(id, "id='" + Repeated("\xF0\x9F\x8E\x9E", 1000) + "'"), NCF_E_INVALIDARG,
+                  Repeated("\xF0\x9F\x8E\x9E", 60) + "...\"");
+}
+
+TEST(ParameterDocumentHostile, NothingMayFollowTheEndNotEvenAZero) {
+    ExpectRefusal(kWhole + std::string(1, '\0'), NCF_E_FAIL, "");
+    ExpectRefusal(kWhole + std::string("\0<junk", 6), NCF_E_FAIL, "");
+    ExpectRefusal(kWhole + kWhole, NCF_E_FAIL, "");
+}
+
 TEST(ParameterDocumentHostile, NumbersThatAreNoneAreRefused) {
     for (const char* const number : {"", " ", "-1", "+1", "0x10", "1.0", "4294967296", "1 2", "one",
                                      "99999999999999999999999999", "1e3", "\xD9\xA1"}) {

@@ -158,6 +158,17 @@ TEST_F(ParametersReader, RefusesTextsThatAreTooLargeOrHaveNoPlace) {
                            "1 Parameter document refused: a character that has no place in it"}));
 }
 
+// A text does not end at a zero in it, so nothing hides behind one.
+TEST_F(ParametersReader, ReadsTheWholeTextPastAZero) {
+    for (const ncfUInt32 encoding : {kNCFUTF8, kNCFUTF16, kNCFUTF32, kNCFWCHAR}) {
+        listener->lines.clear();
+        const auto text = host::MakeString(kXml + std::string(1, '\0') + "<hidden/>", encoding);
+        EXPECT_EQ(reader->Parse(text.get()), NCF_E_FAIL);
+        EXPECT_TRUE(listener->lines.empty());
+    }
+    EXPECT_EQ(told.size(), 4u);
+}
+
 TEST_F(ParametersReader, NeedsATextAndAHandler) {
     EXPECT_EQ(reader->Parse(nullptr), NCF_E_POINTER);
     EXPECT_EQ(reader->SetHandler(nullptr), NCF_OK);

@@ -104,6 +104,25 @@ TEST_F(QTParametersDocuments, MarkTheOrderThatIsDetectedNowNotAtAttaching) {
     EXPECT_EQ(journal.count("suite.AddValueChoice 'Progressive' 256 default"), 1);
 }
 
+TEST_F(QTParametersDocuments, MarkTheDefaultsWhateverIsChosen) {
+    Record() = {4096, 16, 1, 512};
+    Attach();
+    Record() = {4096, 2, 3, 512};
+    EXPECT_EQ(parameters->GetParameterDescriptionXML(xml.inArg()), NCF_OK);
+    EXPECT_EQ(Lines(journal.lines().begin() + 3, journal.lines().begin() + 31), Description("512"));
+}
+
+TEST_F(QTParametersDocuments, HoldTheDefaultsInTheDefaultSetWhateverSetIsCurrent) {
+    Record().detectedFieldOrder = 512;
+    Attach();
+    EXPECT_EQ(Set({}), NCF_OK);
+    journal.clear();
+    EXPECT_EQ(parameters->GetDefaultValuesXML(xml.inArg()), NCF_OK);
+    EXPECT_EQ(journal.lines(),
+              kOpening + WrittenSet("set:default 'Default Settings' 0 1.0 1", 512, 1, 16) +
+                  Lines{"suite.WriteXML"});
+}
+
 TEST_F(QTParametersDocuments, NameTheSetAsTheLastDocumentDid) {
     Attach();
     EXPECT_EQ(Set({}), NCF_OK);

@@ -61,6 +61,16 @@ TEST_F(QTParametersEvents, LeaveTheClipAloneForAnotherComponent) {
     EXPECT_EQ(Record().fieldLayout, 1u);
 }
 
+// The name is that of the set told of last, whoever's it is; only values ask for
+// the component.
+TEST_F(QTParametersEvents, TakeNameAndIdentifierOfASetOfAnotherComponent) {
+    Attach();
+    Told told;
+    told.component = NMA::CompID_QTParameters;
+    EXPECT_EQ(Set(told), NCF_OK);
+    EXPECT_EQ(CurrentSet(), "11111111 'My set' 0 1.0 0");
+}
+
 TEST_F(QTParametersEvents, LeaveEverythingAloneForASetThatIsNotInUse) {
     Attach();
     Told told;
