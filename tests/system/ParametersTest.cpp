@@ -4,11 +4,8 @@
 // Parameters of real movies through the built module: what is shown, what
 // changes frames and formats, what can be saved and applied, and what is not.
 
-#include <sys/wait.h>
-
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
 #include <cstdlib>
 #include <fstream>
 
@@ -19,20 +16,18 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ParameterFile.h"
 #include "reference_host/framework/SampleRequest.h"
+#include "tests/system/ParameterDocuments.h"
 #include "tests/system/SystemTest.h"
 
 namespace {
 
+using namespace parameter_documents;
 using cliphost::ClipParameters;
 using cliphost::ParameterXml;
 using Numbers = std::vector<ncfUInt32>;
 
 // Interlaced, upper field first, decoded to 8-bit and deeper formats.
 constexpr char kInterlaced[] = "prores_4444_1080i.mov";
-
-constexpr char kMapping[] = "0E74B673-0CA8-403B-A142-986D79508637";
-constexpr char kSet[] = "11111111-2222-3333-4444-555555555555";
-constexpr char kOtherSet[] = "22222222-2222-3333-4444-555555555555";
 
 // A picture format on offer, as much of it as parameters change.
 struct Format {
@@ -154,20 +149,6 @@ private:
         return numbers;
     }
 };
-
-std::string SetXml(const char* id, const char* attributes, ncfUInt32 levels,
-                   const char* name = "Mine") {
-    return std::string("<parameterSet id='") + id + "' " + attributes + "><name>" + name +
-           "</name><parameter id='322655D5-0A56-46CA-9260-D006F719B8A4'><valueUInt32>" +
-           std::to_string(levels) + "</valueUInt32></parameter></parameterSet>";
-}
-std::string DocumentXml(const std::string& content, const char* component = kMapping) {
-    return std::string("<ncfComponents><component id='") + component + "'><track number='0'>" +
-           content + "</track></component></ncfComponents>";
-}
-std::string InUse(const char* set) {
-    return std::string("<activeSet>") + set + "</activeSet>";
-}
 
 // --- what is shown ---------------------------------------------------------------------
 
@@ -480,103 +461,6 @@ TEST_F(Parameters, OfFilesInOtherEncodingsAreRefused) {
     EXPECT_THROW(cliphost::ReadParameterFile(folder() / "missing.xml"), cliphost::Failure);
     EXPECT_THROW(cliphost::ReadParameterFile(folder()), cliphost::Failure);
     EXPECT_THROW(cliphost::ReadParameterFile("/dev/zero"), cliphost::Failure);
-}
-
-// --- the program -------------------------------------------------------------------------------
-
-struct Ran {
-    int status;
-    std::string output;
-};
-
-Ran Params(const std::string& arguments) {
-    const std::string command =
-        "'" + (ProgramFolder() / "cliphost").string() + "' params " + arguments + " 2>&1";
-    FILE* const pipe = popen(command.c_str(), "r");
-    Ran ran{-1, {}};
-    char buffer[4096];
-    for (std::size_t n = 0; pipe && (n = fread(buffer, 1, sizeof buffer, pipe)) > 0;) {
-        ran.output.append(buffer, n);
-    }
-    const int status = pipe ? pclose(pipe) : -1;
-    ran.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    return ran;
-}
-
-class ParamsVerb : public Parameters {
-protected:
-    const std::string movie = "'" + MadeMovie(kInterlaced).string() + "'";
-};
-
-TEST_F(ParamsVerb, PrintsChoicesWithAStarAtTheOneInUse) {
-    const Ran ran = Params(movie + " --set 'Level Remapping=Expand'");
-    EXPECT_EQ(ran.status, 0);
-    EXPECT_EQ(ran.output, MadeMovie(kInterlaced).string() +
-                              ": Custom\n"
-                              "  Field Ordering (\"Field Ordering In File\")\n"
-                              "      Progressive\n"
-                              "      Interlaced - Odd (upper field first) ordered (default)\n"
-                              "      Interlaced - Even (lower field first) ordered\n"
-                              "    * none of these: 8192\n"
-                              "  Field Layout (\"Field Layout\")\n"
-                              "      Merged\n"
-                              "      Split\n"
-                              "    * none of these: 1 (default)\n"
-                              "  GFX-Video Level (\"Level Remapping\")\n"
-                              "      Do not modify levels (default)\n"
-                              "    * Expand video levels to graphic levels\n"
-                              "      Compress graphic levels to video levels\n");
-}
-
-TEST_F(ParamsVerb, PrintsDocumentsThatItTakesBack) {
-    const Ran values = Params(movie + " --set 'Field Layout=Split' --xml values");
-    EXPECT_EQ(values.status, 0);
-    const auto file = WriteText(values.output, "values.xml");
-    const Ran again = Params(movie + " --set-xml '" + file.string() + "' --xml values");
-    EXPECT_EQ(again.status, 0);
-    EXPECT_EQ(again.output, values.output);
-    const Ran reset = Params(movie + " --set 'Level Remapping=1' --reset --set-xml '" +
-                             file.string() + "' --json");
-    EXPECT_EQ(reset.status, 0) << reset.output;
-    EXPECT_NE(reset.output.find("\"value\": 512,"), std::string::npos) << "reset after the file";
-    EXPECT_NE(reset.output.find("\"value\": 1,\n      \"default\": 16,"), std::string::npos)
-        << "and before the values";
-    EXPECT_NE(Params(movie + " --xml description").output.find("<parameterInfos>"),
-              std::string::npos);
-    EXPECT_NE(Params(movie + " --xml defaults").output.find("<valueUInt32>512<"),
-              std::string::npos);
-}
-
-TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
-    const auto broken = WriteText("<ncfComponents>", "broken.xml");
-    const auto other = WriteText(DocumentXml(SetXml(kSet, "", 1), kSet), "other.xml");
-    const struct {
-        std::string arguments;
-        int status;
-        const char* words;
-    } kCalls[] = {
-        {"--set 'Volume=11'", 2, "no such parameter, but these:\n    Field Ordering In File"},
-        {"--set 'Level Remapping=Louder'", 2, "no such choice; write one of these"},
-        {"--set 'Level Remapping='", 2, "no such choice"},
-        {"--set 'Field Ordering=Interlaced'", 2, "several choices begin so"},
-        {"--set 'Field Ordering'", 2, "name=value"},
-        {"--set-xml /no/such/file.xml", 2, "there is no such file"},
-        {"--set-xml '" + broken.string() + "'", 2, "1:16: no element found"},
-        {"--set-xml '" + other.string() + "'", 0, "none was taken"},
-        {"--xml everything", 2, "--xml"},
-        {"--xml values --json", 2, "--json"},
-    };
-    for (const auto& call : kCalls) {
-        const Ran ran = Params(movie + " " + call.arguments);
-        EXPECT_EQ(ran.status, call.status) << call.arguments << "\n" << ran.output;
-        EXPECT_NE(ran.output.find(call.words), std::string::npos) << call.arguments << "\n"
-                                                                  << ran.output;
-    }
-    EXPECT_EQ(Params("/no/such/movie.mov").status, 2);
-    const auto text = WriteText("hello", "text.mov");
-    const Ran ran = Params("'" + text.string() + "'");
-    EXPECT_EQ(ran.status, 1);
-    EXPECT_NE(ran.output.find("text.mov: no parameters: "), std::string::npos) << ran.output;
 }
 
 }  // namespace

@@ -1,0 +1,177 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// Parameters on the command line: what the program prints of them, and what
+// their options change in what it lists and writes.
+
+#include <sys/wait.h>
+
+#include <cstdio>
+#include <fstream>
+#include <iterator>
+
+#include "tests/system/ParameterDocuments.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using namespace parameter_documents;
+
+// Interlaced, upper field first, decoded to 8-bit and deeper formats.
+constexpr char kInterlaced[] = "prores_4444_1080i.mov";
+
+struct Ran {
+    int status;
+    std::string output;
+};
+
+Ran Cliphost(const std::string& arguments) {
+    const std::string command =
+        "'" + (ProgramFolder() / "cliphost").string() + "' " + arguments + " 2>&1";
+    FILE* const pipe = popen(command.c_str(), "r");
+    Ran ran{-1, {}};
+    char buffer[4096];
+    for (std::size_t n = 0; pipe && (n = fread(buffer, 1, sizeof buffer, pipe)) > 0;) {
+        ran.output.append(buffer, n);
+    }
+    const int status = pipe ? pclose(pipe) : -1;
+    ran.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+    return ran;
+}
+
+Ran Params(const std::string& arguments) {
+    return Cliphost("params " + arguments);
+}
+
+class ParamsVerb : public SystemTest {
+protected:
+    std::filesystem::path WriteText(const std::string& text, const std::string& name) {
+        return Write(movies::Bytes(text.begin(), text.end()), name);
+    }
+    const std::string movie = "'" + MadeMovie(kInterlaced).string() + "'";
+};
+
+TEST_F(ParamsVerb, PrintsChoicesWithAStarAtTheOneInUse) {
+    const Ran ran = Params(movie + " --set 'Level Remapping=Expand'");
+    EXPECT_EQ(ran.status, 0);
+    EXPECT_EQ(ran.output, MadeMovie(kInterlaced).string() +
+                              ": Custom\n"
+                              "  Field Ordering (\"Field Ordering In File\")\n"
+                              "      Progressive\n"
+                              "      Interlaced - Odd (upper field first) ordered (default)\n"
+                              "      Interlaced - Even (lower field first) ordered\n"
+                              "    * none of these: 8192\n"
+                              "  Field Layout (\"Field Layout\")\n"
+                              "      Merged\n"
+                              "      Split\n"
+                              "    * none of these: 1 (default)\n"
+                              "  GFX-Video Level (\"Level Remapping\")\n"
+                              "      Do not modify levels (default)\n"
+                              "    * Expand video levels to graphic levels\n"
+                              "      Compress graphic levels to video levels\n");
+}
+
+TEST_F(ParamsVerb, PrintsDocumentsThatItTakesBack) {
+    const Ran values = Params(movie + " --set 'Field Layout=Split' --xml values");
+    EXPECT_EQ(values.status, 0);
+    const auto file = WriteText(values.output, "values.xml");
+    const Ran again = Params(movie + " --set-xml '" + file.string() + "' --xml values");
+    EXPECT_EQ(again.status, 0);
+    EXPECT_EQ(again.output, values.output);
+    const Ran reset = Params(movie + " --set 'Level Remapping=1' --reset --set-xml '" +
+                             file.string() + "' --json");
+    EXPECT_EQ(reset.status, 0) << reset.output;
+    EXPECT_NE(reset.output.find("\"value\": 512,"), std::string::npos) << "reset after the file";
+    EXPECT_NE(reset.output.find("\"value\": 1,\n      \"default\": 16,"), std::string::npos)
+        << "and before the values";
+    EXPECT_NE(Params(movie + " --xml description").output.find("<parameterInfos>"),
+              std::string::npos);
+    EXPECT_NE(Params(movie + " --xml defaults").output.find("<valueUInt32>512<"),
+              std::string::npos);
+}
+
+TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
+    const auto broken = WriteText("<ncfComponents>", "broken.xml");
+    const auto other = WriteText(DocumentXml(SetXml(kSet, "", 1), kSet), "other.xml");
+    const struct {
+        std::string arguments;
+        int status;
+        const char* words;
+    } kCalls[] = {
+        {"--set 'Volume=11'", 2, "no such parameter, but these:\n    Field Ordering In File"},
+        {"--set 'Level Remapping=Louder'", 2, "no such choice; write one of these"},
+        {"--set 'Level Remapping='", 2, "no such choice"},
+        {"--set 'Field Ordering=Interlaced'", 2, "several choices begin so"},
+        {"--set 'Field Ordering'", 2, "name=value"},
+        {"--set-xml /no/such/file.xml", 2, "there is no such file"},
+        {"--set-xml '" + broken.string() + "'", 2, "1:16: no element found"},
+        {"--set-xml '" + other.string() + "'", 0, "none was taken"},
+        {"--xml everything", 2, "--xml"},
+        {"--xml values --json", 2, "--json"},
+    };
+    for (const auto& call : kCalls) {
+        const Ran ran = Params(movie + " " + call.arguments);
+        EXPECT_EQ(ran.status, call.status) << call.arguments << "\n" << ran.output;
+        EXPECT_NE(ran.output.find(call.words), std::string::npos) << call.arguments << "\n"
+                                                                  << ran.output;
+    }
+    EXPECT_EQ(Params("/no/such/movie.mov").status, 2);
+    const auto text = WriteText("hello", "text.mov");
+    const Ran ran = Params("'" + text.string() + "'");
+    EXPECT_EQ(ran.status, 1);
+    EXPECT_NE(ran.output.find("text.mov: no parameters: "), std::string::npos) << ran.output;
+}
+
+// --- the same options of the verbs that show what follows -------------------------------------
+
+TEST_F(ParamsVerb, OptionsChangeTheFormatsThatAreListed) {
+    const auto document =
+        WriteText(DocumentXml(std::string("<parameterSet id='") + kSet +
+                              "'><parameter id='6CAEDE80-2DE0-4E2F-9F5D-904B7A2C2F4A'>"
+                              "<valueUInt32>4096</valueUInt32></parameter></parameterSet>"),
+                  "bottom.xml");
+    const std::string fromFile = "--set-xml '" + document.string() + "'";
+    const struct {
+        std::string options;
+        const char* height;
+        const char* words;
+    } kCalls[] = {
+        {"", "field 1920 x 540", "interlaced, top field first, both fields in one frame"},
+        {"--set 'Field Ordering=progressive'", "frame 1920 x 1080", "progressive"},
+        {"--set 'Field Layout=Split'", "field 1920 x 540",
+         "interlaced, top field first, each field by itself"},
+        {fromFile, "field 1920 x 540", "interlaced, bottom field first, both fields in one frame"},
+        {fromFile + " --reset", "field 1920 x 540", "top field first"},
+    };
+    for (const auto& call : kCalls) {
+        const Ran ran = Cliphost("formats " + movie + " " + call.options);
+        EXPECT_EQ(ran.status, 0) << call.options << "\n" << ran.output;
+        EXPECT_NE(ran.output.find(call.height), std::string::npos) << ran.output;
+        EXPECT_NE(ran.output.find(call.words), std::string::npos) << ran.output;
+    }
+    EXPECT_EQ(Cliphost("formats " + movie + " --set 'Volume=11'").status, 2);
+}
+
+TEST_F(ParamsVerb, OptionsChangeTheFrameThatIsWritten) {
+    const std::string picture = "'" + MadeMovie("png.mov").string() + "'";
+    const auto frame = [&](const std::string& arguments) {
+        const std::filesystem::path file = folder() / "frame.raw";
+        const Ran ran =
+            Cliphost("frame " + picture + " " + arguments + " -o '" + file.string() + "'");
+        EXPECT_EQ(ran.status, 0) << ran.output;
+        std::ifstream stream(file, std::ios::binary);
+        return std::string((std::istreambuf_iterator<char>(stream)),
+                           std::istreambuf_iterator<char>());
+    };
+    const std::string plain = frame("");
+    const std::string expanded = frame("--set 'Level Remapping=Expand'");
+    ASSERT_FALSE(plain.empty());
+    EXPECT_EQ(expanded.size(), plain.size());
+    EXPECT_NE(expanded, plain);
+    EXPECT_EQ(
+        frame("--set-xml '" + WriteText(DocumentXml(SetXml(kSet, "", 1)), "up.xml").string() + "'"),
+        expanded);
+    EXPECT_EQ(frame("--reset"), plain);
+}
+
+}  // namespace
