@@ -12,6 +12,7 @@
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/HostText.h"
@@ -173,8 +174,9 @@ std::vector<ClipParameter> ClipParameters::List() {
     return list;
 }
 
+// Of the description, which stands also for a set whose identifier is zero.
 std::string ClipParameters::SetName() {
-    const host::ParameterTrack track = Read(ParameterXml::kValues).second;
+    const host::ParameterTrack track = Read(ParameterXml::kDescription).second;
     const host::ParameterSet* const set = track.SetInUse();
     return set == nullptr ? std::string() : set->name;
 }
@@ -229,10 +231,10 @@ void ClipParameters::Apply(const std::string& xml, const std::filesystem::path& 
     host::ParameterDocument document;
     std::string problem;
     if (host::ReadParameterDocument(xml, document, problem) >= 0 && !HoldsValues(document)) {
-        fmt::print(stderr,
-                   "cliphost: {}: no values for this clip are in use there, so none was "
-                   "taken\n",
-                   DisplayPath(file));
+        Notice(
+            "cliphost: {}: no values for this clip are in use there, so none was "
+            "taken\n",
+            DisplayPath(file));
     }
 }
 
@@ -243,7 +245,7 @@ void ClipParameters::Reset() {
         throw Failure(kExitFile, fmt::format("{}: the parameters can't be reset: {}",
                                              DisplayPath(movie_), ResultText(result)));
     }
-    HandOver(Xml(ParameterXml::kValues), kExitFile,
+    HandOver(Xml(ParameterXml::kDescription), kExitFile,
              DisplayPath(movie_) + ": the module refuses its own values");
 }
 

@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/parameters/ShownText.h"
 
 namespace cliphost {
 namespace {
@@ -27,6 +28,9 @@ struct ParamsOptions {
 const std::map<std::string, ParameterXml> kXml = {{"values", ParameterXml::kValues},
                                                   {"description", ParameterXml::kDescription},
                                                   {"defaults", ParameterXml::kDefaults}};
+
+// The name of a set may come from any document.
+constexpr std::size_t kLongestName = 200;
 
 // All choices of a parameter, a star at the one in use. A number that is none of
 // them is the file's own way.
@@ -81,7 +85,7 @@ void Print(ClipParameters& parameters, const ParamsOptions& options) {
     const std::vector<ClipParameter> list = parameters.List();
     const std::string set = parameters.SetName();
     if (!options.json) {
-        fmt::print("{}: {}\n", DisplayPath(options.movie), set);
+        fmt::print("{}: {}\n", DisplayPath(options.movie), host::ShownText(set, kLongestName));
         for (const ClipParameter& parameter : list) {
             PrintParameter(parameter);
         }

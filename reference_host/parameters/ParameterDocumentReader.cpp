@@ -1,6 +1,5 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <cstring>
@@ -9,7 +8,7 @@
 #include "reference_host/parameters/GuidText.h"
 #include "reference_host/parameters/ParameterDocument.h"
 #include "reference_host/parameters/ParameterNames.h"
-#include "reference_host/util/text/Encodings.h"
+#include "reference_host/parameters/ShownText.h"
 #include "reference_host/xml/EventReader.h"
 #include "reference_host/xml/XmlTree.h"
 
@@ -42,19 +41,8 @@ std::string PlaceOf(const pugi::xml_node& node) {
     throw Refusal{result, PlaceOf(node) + ": " + what};
 }
 
-// A foreign text for a message: short, on one line, and nothing in it that a
-// terminal would take for a command.
-std::string Shown(std::string_view text) {
-    constexpr std::size_t kMost = 60;
-    std::u32string characters = text::FromUtf8(text.substr(0, 4 * kMost));
-    const bool isCut = characters.size() > kMost || text.size() > 4 * kMost;
-    characters.resize(std::min(characters.size(), kMost));
-    for (char32_t& c : characters) {
-        if (c < 0x20 || (c >= 0x7F && c < 0xA0)) {
-            c = U' ';
-        }
-    }
-    return "\"" + text::ToUtf8Lossy(characters) + (isCut ? "...\"" : "\"");
+std::string Quoted(std::string_view text) {
+    return "\"" + ShownText(text, 60) + "\"";
 }
 
 std::string_view Trimmed(std::string_view text) {
@@ -87,7 +75,7 @@ std::string ChildText(const pugi::xml_node& node, const char* name) {
 GUID Id(const pugi::xml_node& node, std::string_view text, const char* what) {
     GUID id{};
     if (!ReadGuid(Trimmed(text), id)) {
-        Refuse(node, std::string(what) + " is " + Shown(text) + ", which is no identifier");
+        Refuse(node, std::string(what) + " is " + Quoted(text) + ", which is no identifier");
     }
     return id;
 }
@@ -105,7 +93,7 @@ ncfUInt32 Number(const pugi::xml_node& node, std::string_view text) {
     ncfUInt32 number = 0;
     const auto end = std::from_chars(digits.data(), digits.data() + digits.size(), number);
     if (digits.empty() || end.ec != std::errc() || end.ptr != digits.data() + digits.size()) {
-        Refuse(node, "holds " + Shown(text) + ", which is no number of 32 bits without sign");
+        Refuse(node, "holds " + Quoted(text) + ", which is no number of 32 bits without sign");
     }
     return number;
 }
@@ -121,7 +109,7 @@ float Version(const pugi::xml_node& node) {
     const auto end = std::from_chars(digits.data(), digits.data() + digits.size(), number);
     if (digits.empty() || end.ec != std::errc() || end.ptr != digits.data() + digits.size() ||
         !std::isfinite(number)) {
-        Refuse(child, "holds " + Shown(text) + ", which is no version");
+        Refuse(child, "holds " + Quoted(text) + ", which is no version");
     }
     return number;
 }

@@ -358,6 +358,20 @@ TEST_F(Parameters, OfAReadOnlySetGiveTheirNameAndNoValue) {
     EXPECT_EQ(parameters->SetName(), "Mine");
 }
 
+// The module gives no document of values for such a set.
+TEST_F(Parameters, OfASetWhoseIdentifierIsZeroAreShownAndReset) {
+    constexpr char kZero[] = "00000000-0000-0000-0000-000000000000";
+    Open(kInterlaced);
+    EXPECT_EQ(Refusal(DocumentXml(SetXml(kZero, "", 1))), "");
+    EXPECT_THROW(parameters->Xml(ParameterXml::kValues), cliphost::Failure);
+    EXPECT_EQ(Now()[2], 1u);
+    EXPECT_EQ(parameters->SetName(), "Mine");
+    parameters->Reset();
+    EXPECT_EQ(Now(), (Numbers{512, 1, 16}));
+    EXPECT_EQ(parameters->SetName(), "Default Settings");
+    EXPECT_EQ(Formats().front().order, 512u);
+}
+
 TEST_F(Parameters, OfOtherComponentsAndUnknownOnesChangeNothing) {
     Open(kInterlaced);
     EXPECT_EQ(Refusal(DocumentXml(SetXml(kSet, "", 1), kSet)), "");

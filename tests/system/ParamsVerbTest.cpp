@@ -71,6 +71,14 @@ TEST_F(ParamsVerb, PrintsChoicesWithAStarAtTheOneInUse) {
                               "      Compress graphic levels to video levels\n");
 }
 
+TEST_F(ParamsVerb, PrintsTheNameOfASetOnOneLineWithoutCommandsToTheTerminal) {
+    const auto file =
+        WriteText(DocumentXml(SetXml(kSet, "", 1, "One&#10;two&#x9B;2J")), "name.xml");
+    const Ran ran = Params(movie + " --set-xml '" + file.string() + "'");
+    EXPECT_EQ(ran.status, 0);
+    EXPECT_NE(ran.output.find(": One two 2J\n"), std::string::npos) << ran.output;
+}
+
 TEST_F(ParamsVerb, PrintsDocumentsThatItTakesBack) {
     const Ran values = Params(movie + " --set 'Field Layout=Split' --xml values");
     EXPECT_EQ(values.status, 0);
