@@ -8,6 +8,7 @@
 #include <system_error>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/UnfinishedFile.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -20,6 +21,25 @@ using host::DisplayPath;
 using PinTimeFunction = HRESULT (*)(const aafTimeStamp_t* time, const aafUID_t* generation);
 
 constexpr aafUID_t kPinnedGeneration = ncfGuid("00000000-0000-0000-0000-000000000001");
+
+// The file takes its place by its name, so a device or a folder there would be
+// lost, or stand in the way.
+void CheckPlace(const std::filesystem::path& path) {
+    std::error_code ignored;
+    const auto there = std::filesystem::status(path, ignored);
+    if (std::filesystem::exists(there) && !std::filesystem::is_regular_file(there)) {
+        throw Failure(
+            kExitCaller,
+            fmt::format("{}: not saved: a {} is there; name another file", DisplayPath(path),
+                        std::filesystem::is_directory(there) ? "folder" : "device"));
+    }
+    const std::filesystem::path folder = std::filesystem::absolute(path, ignored).parent_path();
+    if (!std::filesystem::is_directory(folder, ignored)) {
+        throw Failure(kExitCaller,
+                      fmt::format("{}: not saved: there is no folder {}; make it first",
+                                  DisplayPath(path), DisplayPath(folder)));
+    }
+}
 
 }  // namespace
 
@@ -73,33 +93,27 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
         if (result < 0) {
             const std::string reason = TextOfResult(result);
             throw Failure(
-                kExitFile,
+                kExitCaller,
                 fmt::format("{}: not saved: {} failed: {}", DisplayPath(path), step,
                             reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result))
                                            : reason));
         }
     };
+    CheckPlace(path);
     // A library may refuse to open over a file that exists.
-    const std::filesystem::path fresh = path.string() + ".new";
-    std::error_code ignored;
-    std::filesystem::remove(fresh, ignored);
-    try {
-        AafRef<IAAFFile> copy;
-        check(openNew(Wide(DisplayPath(fresh)).c_str(), &kAAFFileKind_Aaf512Binary, 0,
-                      &identification, copy.Out()),
-              "opening a new file");
-        check(file->SaveCopyAs(copy.get()), "copying the description");
-        check(copy->Save(), "saving");
-        check(copy->Close(), "closing");
-    } catch (...) {
-        std::filesystem::remove(fresh, ignored);
-        throw;
-    }
+    UnfinishedFile fresh(path);
     std::error_code error;
-    std::filesystem::rename(fresh, path, error);
+    std::filesystem::remove(fresh.path(), error);
+    AafRef<IAAFFile> copy;
+    check(openNew(Wide(DisplayPath(fresh.path())).c_str(), &kAAFFileKind_Aaf512Binary, 0,
+                  &identification, copy.Out()),
+          "opening a new file");
+    check(file->SaveCopyAs(copy.get()), "copying the description");
+    check(copy->Save(), "saving");
+    check(copy->Close(), "closing");
+    fresh.TakePlace(error);
     if (error) {
-        std::filesystem::remove(fresh, ignored);
-        throw Failure(kExitFile,
+        throw Failure(kExitCaller,
                       fmt::format("{}: not saved: {}", DisplayPath(path), error.message()));
     }
 }

@@ -3,6 +3,8 @@
 #include <fmt/format.h>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/SoundReader.h"
@@ -33,10 +35,10 @@ std::uint64_t WantedCount(const AudioOptions& options, const SoundReader& sound)
     }
     const std::uint64_t left = sound.Count() - options.start;
     if (options.count && *options.count > left) {
-        fmt::print(stderr,
-                   "cliphost: {}: only {} samples follow sample {}; all of them are "
-                   "written\n",
-                   DisplayPath(options.movie), left, options.start);
+        Notice(
+            "cliphost: {}: only {} samples follow sample {}; all of them are "
+            "written\n",
+            DisplayPath(options.movie), left, options.start);
     }
     return std::min(options.count.value_or(left), left);
 }
@@ -76,11 +78,7 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
         throw Failure(kExitFile, fmt::format("{}: {} channels at {} Hz are no form of a WAV file",
                                              DisplayPath(options.movie), form.channels, form.rate));
     }
-    std::error_code ignored;
-    if (std::filesystem::equivalent(options.output, options.movie, ignored)) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: this is the movie itself", DisplayPath(options.output)));
-    }
+    RefuseOutputOntoMovie(options.output, options.movie);
     std::uint64_t silent = 0;
     try {
         OutputFile output(options.output);
@@ -98,8 +96,8 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
                    count, form.channels, form.channels == 1 ? "" : "s", form.rate);
     }
     if (silent > 0) {
-        fmt::print(stderr, "cliphost: {}: {} of {} samples could not be read and are silence\n",
-                   DisplayPath(options.movie), silent, count);
+        Notice("cliphost: {}: {} of {} samples could not be read and are silence\n",
+               DisplayPath(options.movie), silent, count);
     }
     return silent == 0 ? kExitFine : kExitFile;
 }
@@ -114,12 +112,16 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status) {
         "A file past 4 GiB is an RF64, which WAV programs know.");
     auto options = std::make_shared<AudioOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("--track", options->track, "Its number; the first sound when not given");
-    verb->add_option("--start", options->start, "The first sample, from 0")->capture_default_str();
+    verb->add_option("--track", options->track, "Its number; the first sound when not given")
+        ->check(SmallWholeNumber());
+    verb->add_option("--start", options->start, "The first sample, from 0")
+        ->check(WholeNumber())
+        ->capture_default_str();
     verb->add_option("--count", options->count, "How many samples; all when not given")
-        ->check(CLI::PositiveNumber);
+        ->check(WholeNumber(1));
     verb->add_option("--rate", options->rate,
-                     "Samples a second of a movie that can't be described and so does not tell");
+                     "Samples a second of a movie that can't be described and so does not tell")
+        ->check(SmallWholeNumber(1));
     verb->add_option("-o,--output", options->output, "The WAV file, or - for standard output")
         ->required();
     verb->callback([&session, &status, options] {

@@ -8,6 +8,8 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FrameRange.h"
 #include "reference_host/cliphost/FrameReader.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/PixelsToPicture.h"
@@ -42,6 +44,13 @@ int CellHeight(const ContactOptions& options, const ClipTrack& track, const Fram
 }
 
 int WriteSheet(Essence& essence, const ContactOptions& options) {
+    RefuseOutputOntoMovie(options.output, options.movie);
+    const std::string ending = options.output.extension().string();
+    if (!ending.empty() && ending != ".png") {
+        throw Failure(kExitCaller, fmt::format("{}: '{}' is no ending that is written; give "
+                                               "FILE.png, or - for standard output",
+                                               DisplayPath(options.output), ending));
+    }
     const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
     FrameReader reader(essence, track, "");
     std::unique_ptr<FrameReader> alpha;
@@ -67,8 +76,8 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
         if (result != NCF_OK) {
             ++failed;
             picture = {};  // its cell stays empty
-            fmt::print(stderr, "cliphost: {}: frame {} could not be read: {}\n",
-                       DisplayPath(options.movie), frame, ResultText(result));
+            Notice("cliphost: {}: frame {} could not be read: {}\n", DisplayPath(options.movie),
+                   frame, ResultText(result));
         }
         sheet.Add(picture);
     }

@@ -3,13 +3,15 @@
 
 #include <fmt/format.h>
 
-#include <map>
 #include <nlohmann/json.hpp>
+#include <set>
 
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FolderClips.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/Verbs.h"
@@ -39,66 +41,93 @@ public:
 private:
     void DescribeFolder(const std::filesystem::path& folder);
     void Take(const Description& description);
+    // Does a step; what it fails with is told, and the next one goes on.
+    template <class Step>
+    void GoOnAfterFailure(const std::filesystem::path& path, const Step& step);
+    void Refuse(const nlohmann::ordered_json& entry);
     std::filesystem::path TargetFor(const std::filesystem::path& movie);
 
     Session& session_;
     const DescribeOptions& options_;
-    std::map<std::string, int> namesTaken_;
+    std::set<std::filesystem::path> targetsTaken_;
     nlohmann::ordered_json json_ = nlohmann::ordered_json::array();
     int described_ = 0;
     int failed_ = 0;
+    int statusOfFailure_ = kExitFile;
 };
 
 int DescribeRun::Run() {
     if (!options_.outFolder.empty()) {
-        std::filesystem::create_directories(options_.outFolder);
+        std::error_code error;
+        std::filesystem::create_directories(options_.outFolder, error);
+        if (error) {
+            throw Failure(kExitCaller,
+                          fmt::format("{}: the folder can't be made: {}",
+                                      DisplayPath(options_.outFolder), error.message()));
+        }
     }
     for (const std::filesystem::path& path : options_.paths) {
-        if (std::filesystem::is_directory(path)) {
-            DescribeFolder(path);
-        } else {
-            Take(DescribeMovie(session_, path));
-        }
+        std::error_code ignored;
+        const bool isFolder = std::filesystem::is_directory(path, ignored);
+        GoOnAfterFailure(
+            path, [&] { isFolder ? DescribeFolder(path) : Take(DescribeMovie(session_, path)); });
     }
     if (options_.json) {
         fmt::print("{}\n", json_.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
     } else if (described_ + failed_ != 1) {
         fmt::print("{} described, {} not\n", described_, failed_);
     }
-    return failed_ == 0 ? kExitFine : kExitFile;
+    const bool isOne = described_ + failed_ == 1;
+    return failed_ == 0 ? kExitFine : isOne ? statusOfFailure_ : kExitFile;
+}
+
+template <class Step>
+void DescribeRun::GoOnAfterFailure(const std::filesystem::path& path, const Step& step) {
+    try {
+        step();
+    } catch (const Failure& failure) {
+        statusOfFailure_ = failure.status();
+        Refuse({{"movie", DisplayPath(path)}, {"problem", failure.what()}});
+    }
+}
+
+void DescribeRun::Refuse(const nlohmann::ordered_json& entry) {
+    ++failed_;
+    Notice("cliphost: {}\n", entry["problem"].get<std::string>());
+    json_.push_back(entry);
 }
 
 void DescribeRun::DescribeFolder(const std::filesystem::path& folder) {
     const auto path = PathForModule(folder);
     if (!IsClaimed(session_, path.get())) {
-        fmt::print(stderr, "cliphost: {}: not claimed: no file there is named *.mov\n",
-                   DisplayPath(folder));
-        ++failed_;
-        return;
+        throw Failure(kExitFile, fmt::format("{}: not claimed: no file there is named *.mov",
+                                             DisplayPath(folder)));
     }
     const FolderClips clips(session_, path.get());
     Progress progress("describing", clips.clips().size());
     for (const FolderClip& clip : clips.clips()) {
         progress.Step(DisplayPath(clip.path.filename()));
-        Take(DescribeFromList(session_, clips.list(), clip.index, clip.path));
+        GoOnAfterFailure(clip.path, [&] {
+            Take(DescribeFromList(session_, clips.list(), clip.index, clip.path));
+        });
     }
 }
 
 void DescribeRun::Take(const Description& description) {
     if (!description.file) {
-        ++failed_;
-        fmt::print(stderr, "cliphost: {}\n", description.problem);
-        if (options_.json) {
-            json_.push_back({{"movie", DisplayPath(description.movie)},
-                             {"result", ResultName(description.result)},
-                             {"problem", description.problem}});
-        }
+        Refuse({{"movie", DisplayPath(description.movie)},
+                {"result", ResultName(description.result)},
+                {"problem", description.problem}});
         return;
     }
     std::filesystem::path saved;
     AafRef<IAAFFile> shown = description.file;
     if (!options_.aafFile.empty() || !options_.outFolder.empty()) {
         saved = TargetFor(description.movie);
+        RefuseOutputOntoMovie(saved, description.movie);
+        for (const std::filesystem::path& other : options_.paths) {
+            RefuseOutputOntoMovie(saved, other);
+        }
         session_.aaf().Save(description.file.get(), saved);
         // What is shown is what any reader of the saved file finds.
         shown = session_.aaf().Open(saved);
@@ -126,13 +155,14 @@ std::filesystem::path DescribeRun::TargetFor(const std::filesystem::path& movie)
         return options_.aafFile;
     }
     // Movies of one name in different folders get numbers.
-    std::filesystem::path name = movie.stem();
-    const int number = ++namesTaken_[name.string()];
-    if (number > 1) {
-        name += fmt::format("-{}", number);
+    for (int number = 1;; ++number) {
+        std::filesystem::path name = movie.stem();
+        name += number == 1 ? ".aaf" : fmt::format("-{}.aaf", number);
+        const std::filesystem::path target = options_.outFolder / name;
+        if (targetsTaken_.insert(target).second) {
+            return target;
+        }
     }
-    name += ".aaf";
-    return options_.outFolder / name;
 }
 
 }  // namespace

@@ -7,6 +7,7 @@
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ImageFormats.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -183,8 +184,8 @@ Essence OpenEssence(Session& session, const std::filesystem::path& movie,
                     const ParameterOptions& parameters) {
     Essence essence(session, movie, parameters);
     if (!essence.undescribed().empty()) {
-        fmt::print(stderr, "cliphost: {}\n  what can be mapped is served all the same\n",
-                   essence.undescribed());
+        Notice("cliphost: {}\n  what can be mapped is served all the same\n",
+               essence.undescribed());
     }
     return essence;
 }

@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <charconv>
+#include <limits>
 
 #include "reference_host/cliphost/Failure.h"
 
@@ -35,6 +36,15 @@ std::vector<std::string> Split(const std::string& text) {
 std::uint64_t FrameRange::CountIn(std::uint64_t frames) const {
     const std::uint64_t stop = std::min(end.value_or(frames), frames);
     return first >= stop ? 0 : (stop - first - 1) / step + 1;
+}
+
+FrameRange OneFrame(std::uint64_t frame) {
+    FrameRange range;
+    range.first = frame;
+    if (frame < std::numeric_limits<std::uint64_t>::max()) {
+        range.end = frame + 1;
+    }
+    return range;
 }
 
 FrameRange ParseFrameRange(const std::string& text) {

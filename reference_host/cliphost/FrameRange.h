@@ -22,6 +22,9 @@ struct FrameRange {
 
 // "A:B" or "A:B:STEP"; A and B may be left out. Throws a Failure that shows how
 // to write it.
+// The range that holds this frame alone.
+FrameRange OneFrame(std::uint64_t frame);
+
 FrameRange ParseFrameRange(const std::string& text);
 
 // So many frames of a clip, spread evenly: from the middle of each part.

@@ -5,6 +5,7 @@
 #include <fmt/format.h>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/PixelsToPicture.h"
 #include "reference_host/cliphost/PngFile.h"
 #include "reference_host/framework/HostPath.h"
@@ -108,11 +109,7 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
                                          const std::filesystem::path& movie, bool isOneFrame) {
     const std::string ending = output.extension().string();
     std::error_code ignored;
-    if (!OutputFile::IsStandardOutput(output) &&
-        std::filesystem::equivalent(output, movie, ignored)) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: this is the movie itself", DisplayPath(output)));
-    }
+    RefuseOutputOntoMovie(output, movie);
     if (std::filesystem::is_directory(output, ignored)) {
         return std::make_unique<FolderSink>(output, movie.stem());
     }

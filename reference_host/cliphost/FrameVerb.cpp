@@ -5,6 +5,8 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FrameRange.h"
 #include "reference_host/cliphost/FrameSink.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/ResultText.h"
@@ -53,9 +55,8 @@ private:
 };
 
 FrameRange FrameRun::WantedFrames() {
-    FrameRange range = ParseFrameRange(
-        options_.range.empty() ? fmt::format("{}:{}", options_.frame, options_.frame + 1)
-                               : options_.range);
+    FrameRange range =
+        options_.range.empty() ? OneFrame(options_.frame) : ParseFrameRange(options_.range);
     // One frame need not be counted: it is there or it is not.
     const bool isCertain = options_.range.empty() && range.first < reader_.MostFrames();
     const std::uint64_t count = isCertain ? range.first + 1 : reader_.Count();
@@ -75,19 +76,20 @@ int FrameRun::Run() {
         alpha_ = std::make_unique<FrameReader>(essence_, track, "deepest");
     }
     const FrameRange range = WantedFrames();
-    const auto sink =
-        MakeFrameSink(options_.output, options_.movie, range.CountIn(*range.end) == 1);
+    const std::uint64_t count = range.CountIn(*range.end);
+    const auto sink = MakeFrameSink(options_.output, options_.movie, count == 1);
     if (sink->IsRaw() && options_.withAlpha) {
         throw Failure(kExitCaller,
                       "--with-alpha is for PNG files; raw frames of the alpha are "
                       "those of its own track, see `cliphost formats --use-alpha`");
     }
     if (sink->IsRaw()) {
-        fmt::print(stderr, "{}\n", RawWords(reader_, track_));
+        Notice("{}\n", RawWords(reader_, track_));
     }
-    Progress progress("frames", range.CountIn(*range.end));
+    Progress progress("frames", count);
     try {
-        for (std::uint64_t frame = range.first; frame < *range.end; frame += range.step) {
+        for (std::uint64_t i = 0; i < count; ++i) {
+            const std::uint64_t frame = range.first + i * range.step;
             progress.Step(fmt::format("{}", frame));
             Write(frame, *sink);
         }
@@ -111,9 +113,8 @@ void FrameRun::Write(std::uint64_t frame, FrameSink& sink) {
     if (result != NCF_OK) {
         ++failed_;
         essence_.session().TakeNotices();
-        fmt::print(stderr,
-                   "cliphost: {}: track {}: frame {} is left out, it could not be read: {}\n",
-                   DisplayPath(essence_.movie()), track_.number, frame, ResultText(result));
+        Notice("cliphost: {}: track {}: frame {} is left out, it could not be read: {}\n",
+               DisplayPath(essence_.movie()), track_.number, frame, ResultText(result));
         return;
     }
     sink.Take(frame, reader_, alpha_.get());
@@ -133,9 +134,11 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
         "Standard error tells the pixel format, size and rate of raw frames.");
     auto options = std::make_shared<FrameOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("--track", options->track, "Its number; the first picture when not given");
-    auto* const frame =
-        verb->add_option("--frame", options->frame, "Its number, from 0")->capture_default_str();
+    verb->add_option("--track", options->track, "Its number; the first picture when not given")
+        ->check(SmallWholeNumber());
+    auto* const frame = verb->add_option("--frame", options->frame, "Its number, from 0")
+                            ->check(WholeNumber())
+                            ->capture_default_str();
     verb->add_option("--range", options->range,
                      "FIRST:END or FIRST:END:STEP; END is not among them, and may be left out")
         ->excludes(frame);

@@ -96,6 +96,14 @@ std::string HeaderProblem(std::ifstream& stream) {
 
 std::string DiagnoseMovie(const std::filesystem::path& movie) {
     std::error_code error;
+    const auto status = std::filesystem::status(movie, error);
+    if (std::filesystem::is_directory(status)) {
+        return "this is a folder; give a movie in it";
+    }
+    // A pipe would keep us waiting.
+    if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)) {
+        return "this is no file but a pipe or device; copy what comes from it into a file";
+    }
     const std::uintmax_t size = std::filesystem::file_size(movie, error);
     std::ifstream stream(movie, std::ios::binary);
     if (error || !stream) {

@@ -30,23 +30,19 @@ OutputFile::OutputFile(std::filesystem::path path) : path_(std::move(path)) {
         Fail(EISDIR);
     }
     if (!std::filesystem::exists(status) || std::filesystem::is_regular_file(status)) {
-        written_ = path_;
-        written_ += fmt::format(".{}.part", getpid());
+        unfinished_.emplace(path_);
     }
-    const std::filesystem::path& opened = written_.empty() ? path_ : written_;
+    const std::filesystem::path& opened = unfinished_ ? unfinished_->path() : path_;
     descriptor_ = open(opened.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
     if (descriptor_ < 0) {
-        written_.clear();
-        Fail(errno);
+        const int reason = errno;
+        unfinished_.reset();
+        Fail(reason);
     }
 }
 
 OutputFile::~OutputFile() {
     Close();
-    if (!written_.empty()) {
-        std::error_code ignored;
-        std::filesystem::remove(written_, ignored);
-    }
 }
 
 void OutputFile::Write(const void* bytes, std::size_t size) {
@@ -72,13 +68,12 @@ void OutputFile::Finish() {
     if (descriptor_ > STDERR_FILENO && close(std::exchange(descriptor_, -1)) != 0) {
         Fail(errno);
     }
-    if (!written_.empty()) {
+    if (unfinished_) {
         std::error_code error;
-        std::filesystem::rename(written_, path_, error);
+        unfinished_->TakePlace(error);
         if (error) {
             Fail(error.value());
         }
-        written_.clear();
     }
 }
 

@@ -4,7 +4,10 @@
 
 #include <cstddef>
 #include <filesystem>
+#include <optional>
 #include <stdexcept>
+
+#include "reference_host/cliphost/UnfinishedFile.h"
 
 namespace cliphost {
 
@@ -36,7 +39,7 @@ private:
     void Close();
 
     std::filesystem::path path_;
-    std::filesystem::path written_;  // empty: the place itself is written
+    std::optional<UnfinishedFile> unfinished_;  // none: the place itself is written
     int descriptor_ = -1;
 };
 

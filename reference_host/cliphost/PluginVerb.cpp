@@ -56,7 +56,7 @@ void PrintJson(const Session& session) {
              {"classId", ToText(component.classId)},
              {"classFactory", component.hasFactory}});
     }
-    fmt::print("{}\n", json.dump(2));
+    fmt::print("{}\n", json.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
 }
 
 }  // namespace

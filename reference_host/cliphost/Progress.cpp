@@ -8,6 +8,8 @@
 
 #include <cstdio>
 
+#include "reference_host/cliphost/Notice.h"
+
 namespace cliphost {
 namespace {
 
@@ -20,7 +22,7 @@ Progress::Progress(std::string what, std::size_t count)
 
 Progress::~Progress() {
     if (shown_) {
-        fmt::print(stderr, "\r\033[K");
+        Notice("\r\033[K");
     }
 }
 
@@ -30,8 +32,8 @@ void Progress::Step(const std::string& name) {
     }
     const std::size_t filled = kWidth * done_ / count_;
     ++done_;
-    fmt::print(stderr, "\r\033[K{} [{}{}] {}/{} {}", what_, std::string(filled, '#'),
-               std::string(kWidth - filled, '.'), done_, count_, name);
+    Notice("\r\033[K{} [{}{}] {}/{} {}", what_, std::string(filled, '#'),
+           std::string(kWidth - filled, '.'), done_, count_, name);
     std::fflush(stderr);
 }
 

@@ -6,6 +6,7 @@
 
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/SampleMap.h"
@@ -189,7 +190,7 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
         "1.");
     auto options = std::make_shared<SamplesOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("--track", options->track, "Only this one");
+    verb->add_option("--track", options->track, "Only this one")->check(SmallWholeNumber());
     verb->add_flag("--every", options->every, "Each sample of sound too, not its runs");
     verb->add_flag("--json", options->json, "As JSON");
     verb->callback([&session, &status, options] {

@@ -77,7 +77,7 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
                                                       {"name", facts.name},
                                                       {"newest", facts.newest},
                                                       {"movies", facts.movies}}
-                                   .dump(2));
+                                   .dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
             return;
         }
         if (!facts.claimed) {

@@ -5,10 +5,12 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <cstdio>
 
 #include "host_interfaces/util/NMALogger.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/parameters/RegisterParameterComponents.h"
@@ -21,13 +23,29 @@ namespace {
 
 using host::DisplayPath;
 
+bool HasFormOfTime(const std::string& text) {
+    const std::string form = "0000-00-00T00:00:00Z";
+    if (text.size() != form.size() && text.size() + 1 != form.size()) {
+        return false;
+    }
+    return std::equal(text.begin(), text.end(), form.begin(), [](char is, char should) {
+        return should == '0' ? is >= '0' && is <= '9' : is == should;
+    });
+}
+
+int DaysIn(int year, int month) {
+    constexpr int kDays[] = {31, 28, 31, 30, 31, 30, 31, 31, 30, 31, 30, 31};
+    const bool isLeap = (year % 4 == 0 && year % 100 != 0) || year % 400 == 0;
+    return kDays[month - 1] + (month == 2 && isLeap ? 1 : 0);
+}
+
 aafTimeStamp_t ParseTime(const std::string& text) {
-    int year = 0, month = 0, day = 0, hour = 0, minute = 0, second = 0, read = 0;
-    const int fields = std::sscanf(text.c_str(), "%4d-%2d-%2dT%2d:%2d:%2d%n", &year, &month, &day,
-                                   &hour, &minute, &second, &read);
-    const std::string rest = fields == 6 ? text.substr(static_cast<std::size_t>(read)) : "?";
-    if (fields != 6 || (!rest.empty() && rest != "Z") || month < 1 || month > 12 || day < 1 ||
-        day > 31 || hour > 23 || minute > 59 || second > 59) {
+    int year = 0, month = 0, day = 0, hour = 0, minute = 0, second = 0;
+    const bool isTime =
+        HasFormOfTime(text) && std::sscanf(text.c_str(), "%4d-%2d-%2dT%2d:%2d:%2d", &year, &month,
+                                           &day, &hour, &minute, &second) == 6;
+    if (!isTime || year < 1 || month < 1 || month > 12 || day < 1 || day > DaysIn(year, month) ||
+        hour > 23 || minute > 59 || second > 59) {
         throw Failure(kExitCaller,
                       fmt::format("--pin-time {}: not a time; write 2026-01-31T12:00:00Z", text));
     }
@@ -65,7 +83,7 @@ Session::Session(const SessionOptions& options) {
             notices_.push_back(line);
         }
         if (verbosity > 0) {
-            fmt::print(stderr, "console {}: {}\n", level, line);
+            Notice("console {}: {}\n", level, line);
         }
     });
     host::RegisterXmlComponents(*host_);

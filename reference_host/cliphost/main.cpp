@@ -1,11 +1,18 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include <fcntl.h>
 #include <fmt/format.h>
+#include <unistd.h>
 
+#include <cerrno>
 #include <cstdio>
+#include <iostream>
+#include <system_error>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Verbs.h"
 
 namespace {
@@ -16,9 +23,49 @@ std::filesystem::path ProgramFolder(const char* name) {
     return (error ? std::filesystem::absolute(name) : program).parent_path();
 }
 
-}  // namespace
+// A stream that the caller closed would give its number to the next file that is
+// opened, and what is printed would go into that file.
+void KeepStandardStreams() {
+    for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
+        if (fcntl(stream, F_GETFD) < 0) {
+            // Only errors may be lost; to write results there has to fail.
+            open("/dev/null", stream == STDERR_FILENO ? O_WRONLY : O_RDONLY);
+        }
+    }
+}
 
-int main(int argc, char** argv) {
+void Tell(const std::string& text) {
+    cliphost::Notice("cliphost: {}\n", text);
+}
+
+// What was printed may be lost as late as here.
+int OutputStatus(int error, int status) {
+    if (error == 0 || error == EPIPE) {
+        return status;  // a reader that went away has seen enough
+    }
+    Tell("standard output: not written: " + std::generic_category().message(error));
+    return cliphost::kExitCaller;
+}
+
+int FlushOutput(int status) {
+    errno = 0;
+    std::cout.flush();
+    if (std::fflush(stdout) == 0 && std::cout.good()) {
+        return status;
+    }
+    return OutputStatus(errno != 0 ? errno : EIO, status);
+}
+
+std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
+    std::string text = error.what();
+    const std::vector<std::string> rest = app->remaining();
+    if (app->get_subcommands().empty() && !rest.empty()) {
+        text = fmt::format("'{}' is no verb and no option", rest.front());
+    }
+    return fmt::format("cliphost: {}\nRun with --help for more information.\n", text);
+}
+
+int Run(int argc, char** argv) {
     using namespace cliphost;
     SessionOptions session;
     session.programFolder = ProgramFolder(argv[0]);
@@ -44,15 +91,16 @@ int main(int argc, char** argv) {
     bool useAlpha = false;
     const char* const settings = "Host and editor settings";
     app.add_option("--editor-rate", editorRate, "Frames per second of the project")
-        ->check(CLI::PositiveNumber)
+        ->check(FrameRate())
         ->capture_default_str()
         ->group(settings);
     auto* const forced = app.add_option("--forced-rate", forcedRate,
                                         "Frames per second that clips take instead of their own")
-                             ->check(CLI::PositiveNumber)
+                             ->check(FrameRate())
                              ->group(settings);
     app.add_option("--single-frame-duration", singleFrameDuration,
                    "Length of one-frame clips, in frames")
+        ->check(SmallWholeNumber())
         ->capture_default_str()
         ->group(settings);
     app.add_flag("--movie-header-duration", movieHeaderDuration,
@@ -80,16 +128,32 @@ int main(int argc, char** argv) {
     AddParams(app, session, status);
     AddPlugin(app, session, status);
 
+    RefuseEmptyTexts(app);
+    app.failure_message(CommandLineProblem);
+
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
         return app.exit(error) == 0 ? kExitFine : kExitCaller;
     } catch (const Failure& failure) {
-        fmt::print(stderr, "cliphost: {}\n", failure.what());
+        Tell(failure.what());
         return failure.status();
+    } catch (const std::system_error& error) {
+        if (std::ferror(stdout) != 0) {
+            return OutputStatus(error.code().value(), status);
+        }
+        Tell(error.what());
+        return kExitFile;
     } catch (const std::exception& error) {
-        fmt::print(stderr, "cliphost: {}\n", error.what());
+        Tell(error.what());
         return kExitFile;
     }
     return status;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    KeepStandardStreams();
+    return FlushOutput(Run(argc, argv));
 }

@@ -26,6 +26,13 @@ TEST(FrameRange, BeginsAtZeroAndGoesToTheEndWhereNothingIsSaid) {
     EXPECT_EQ(ParseFrameRange(":7").end, 7u);
 }
 
+TEST(FrameRange, HoldsOneFrameWhateverItsNumber) {
+    EXPECT_EQ(cliphost::OneFrame(7).CountIn(100), 1u);
+    EXPECT_EQ(cliphost::OneFrame(99).CountIn(100), 1u);
+    EXPECT_EQ(cliphost::OneFrame(100).CountIn(100), 0u);
+    EXPECT_EQ(cliphost::OneFrame(UINT64_MAX).CountIn(100), 0u);
+}
+
 TEST(FrameRange, CountsItsFramesInAClip) {
     EXPECT_EQ(ParseFrameRange("0:25").CountIn(100), 25u);
     EXPECT_EQ(ParseFrameRange("0:25").CountIn(10), 10u);

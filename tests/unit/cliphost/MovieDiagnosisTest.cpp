@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/MovieDiagnosis.h"
 
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 
 #include "tests/unit/cliphost/TestFolder.h"
 
@@ -38,6 +39,10 @@ const std::string kType = Atom("ftyp", "qt  \0\0\0\0");
 TEST(MovieDiagnosis, TellsFilesThatHoldNothing) {
     const TestFolder folder;
     EXPECT_NE(DiagnoseMovie(folder / "none.mov").find("can't be read"), std::string::npos);
+    EXPECT_NE(DiagnoseMovie(folder.path()).find("this is a folder"), std::string::npos);
+    // One that nobody writes to would be waited for without end.
+    ASSERT_EQ(mkfifo((folder / "pipe.mov").c_str(), 0600), 0);
+    EXPECT_NE(DiagnoseMovie(folder / "pipe.mov").find("a pipe or device"), std::string::npos);
     ExpectSays("", "the file is empty");
 }
 

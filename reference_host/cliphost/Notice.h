@@ -1,0 +1,21 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <fmt/format.h>
+
+#include <cstdio>
+#include <string>
+#include <utility>
+
+namespace cliphost {
+
+// Prints on standard error. One that takes nothing, on a full disk, must not end
+// what is being done: there is nobody left to tell.
+template <class... Arguments>
+void Notice(fmt::format_string<Arguments...> form, Arguments&&... arguments) {
+    const std::string text = fmt::format(form, std::forward<Arguments>(arguments)...);
+    std::fwrite(text.data(), 1, text.size(), stderr);
+}
+
+}  // namespace cliphost

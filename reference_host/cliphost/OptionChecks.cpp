@@ -1,0 +1,85 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/OptionChecks.h"
+
+#include <fmt/format.h>
+
+#include <charconv>
+#include <filesystem>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+// Slower, a frame outlasts what a timecode counts; faster, no camera is.
+constexpr double kSlowest = 0.01;
+constexpr double kFastest = 10000.0;
+
+template <class Number>
+bool ReadWhole(const std::string& text, Number& number) {
+    const char* const end = text.data() + text.size();
+    const auto read = std::from_chars(text.data(), end, number);
+    return read.ec == std::errc() && read.ptr == end;
+}
+
+}  // namespace
+
+CLI::Validator WholeNumber(std::uint64_t least, std::uint64_t most) {
+    return CLI::Validator(
+        [least, most](std::string& text) {
+            std::uint64_t number = 0;
+            return ReadWhole(text, number) && number >= least && number <= most
+                       ? std::string()
+                       : fmt::format("'{}' is no whole number from {} to {}", text, least, most);
+        },
+        "", "WholeNumber");
+}
+
+CLI::Validator SmallWholeNumber(std::uint64_t least) {
+    return WholeNumber(least, std::numeric_limits<std::uint32_t>::max());
+}
+
+CLI::Validator FrameRate() {
+    return CLI::Validator(
+        [](std::string& text) {
+            double rate = 0.0;
+            // What is no number is not within the bounds either.
+            return ReadWhole(text, rate) && rate >= kSlowest && rate <= kFastest
+                       ? std::string()
+                       : fmt::format(
+                             "'{}' is no number of frames a second from {} to {}; write "
+                             "it such as 25 or 23.976",
+                             text, kSlowest, kFastest);
+        },
+        "", "FrameRate");
+}
+
+void RefuseEmptyTexts(CLI::App& app) {
+    const CLI::Validator isThere(
+        [](std::string& text) {
+            return text.empty() ? std::string("an empty text is no value") : std::string();
+        },
+        "", "NotEmpty");
+    std::vector<CLI::App*> apps = app.get_subcommands([](CLI::App*) { return true; });
+    apps.push_back(&app);
+    for (CLI::App* const one : apps) {
+        for (CLI::Option* const option : one->get_options()) {
+            if (option->get_items_expected_max() > 0) {
+                option->check(isThere);
+            }
+        }
+    }
+}
+
+void RefuseOutputOntoMovie(const std::filesystem::path& output,
+                           const std::filesystem::path& movie) {
+    std::error_code ignored;
+    if (output != "-" && std::filesystem::equivalent(output, movie, ignored)) {
+        throw Failure(kExitCaller, fmt::format("{}: this is the movie itself; name another file",
+                                               host::DisplayPath(output)));
+    }
+}
+
+}  // namespace cliphost

@@ -1,0 +1,27 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <CLI/CLI.hpp>
+
+namespace cliphost {
+
+// Checks of option values, in words that a user can follow.
+
+// A whole number from `least` on that the option's number can hold.
+CLI::Validator WholeNumber(std::uint64_t least = 0,
+                           std::uint64_t most = std::numeric_limits<std::uint64_t>::max());
+// A whole number of 32 bits.
+CLI::Validator SmallWholeNumber(std::uint64_t least = 0);
+// Frames per second that a movie can have.
+CLI::Validator FrameRate();
+
+// No option and no argument means anything by an empty text; it comes from a
+// variable of a script that was never set.
+void RefuseEmptyTexts(CLI::App& app);
+
+// Refuses an output that would be written over the movie that it is made from.
+// Throws a Failure.
+void RefuseOutputOntoMovie(const std::filesystem::path& output, const std::filesystem::path& movie);
+
+}  // namespace cliphost

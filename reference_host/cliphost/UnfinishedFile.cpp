@@ -1,0 +1,86 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/UnfinishedFile.h"
+
+#include <fmt/format.h>
+#include <unistd.h>
+
+#include <atomic>
+#include <climits>
+#include <csignal>
+#include <cstring>
+
+namespace cliphost {
+namespace {
+
+// A handler may touch neither the heap nor a lock, so the names lie in memory
+// that is always there. One file is written at a time; the rest is reserve.
+struct Slot {
+    std::atomic<bool> isTaken{false};
+    std::atomic<bool> isNamed{false};
+    char name[PATH_MAX] = {};
+};
+Slot slots[4];
+
+extern "C" void RemoveUnfinishedFiles(int signal) {
+    for (Slot& slot : slots) {
+        if (slot.isNamed) {
+            unlink(slot.name);
+        }
+    }
+    // The signal comes again once this returns, and then ends the program.
+    std::signal(signal, SIG_DFL);
+    std::raise(signal);
+}
+
+// Signals that the caller had ignored, as nohup does, stay ignored.
+void WatchSignals() {
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE}) {
+        struct sigaction present {};
+        if (sigaction(signal, nullptr, &present) == 0 && present.sa_handler == SIG_DFL) {
+            std::signal(signal, RemoveUnfinishedFiles);
+        }
+    }
+}
+
+int TakeSlot(const std::string& name) {
+    for (std::size_t i = 0; i < std::size(slots) && name.size() < PATH_MAX; ++i) {
+        if (!slots[i].isTaken.exchange(true)) {
+            std::memcpy(slots[i].name, name.c_str(), name.size() + 1);
+            slots[i].isNamed = true;
+            return static_cast<int>(i);
+        }
+    }
+    return -1;
+}
+
+}  // namespace
+
+UnfinishedFile::UnfinishedFile(const std::filesystem::path& place) : place_(place), path_(place) {
+    path_ += fmt::format(".{}.part", getpid());
+    // Absolute, should the working folder change.
+    std::error_code error;
+    const std::filesystem::path absolute = std::filesystem::absolute(path_, error);
+    slot_ = TakeSlot(error ? path_.native() : absolute.native());
+    WatchSignals();
+}
+
+UnfinishedFile::~UnfinishedFile() {
+    std::error_code ignored;
+    if (!path_.empty()) {
+        std::filesystem::remove(path_, ignored);
+    }
+    if (slot_ >= 0) {
+        slots[slot_].isNamed = false;
+        slots[slot_].isTaken = false;
+    }
+}
+
+void UnfinishedFile::TakePlace(std::error_code& error) {
+    std::filesystem::rename(path_, place_, error);
+    if (!error) {
+        path_.clear();
+    }
+}
+
+}  // namespace cliphost

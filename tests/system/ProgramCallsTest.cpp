@@ -1,0 +1,214 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// The program as scripts and careless hands call it: what it refuses, what it
+// keeps safe, and what it goes on with.
+
+#include <sys/stat.h>
+
+#include <nlohmann/json.hpp>
+
+#include "tests/system/EssenceSupport.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using Json = nlohmann::json;
+
+class ProgramCalls : public SystemTest {
+protected:
+    std::string Out(const std::string& name) { return (folder() / name).string(); }
+    std::string Copy(const std::string& made, const std::string& name) {
+        std::filesystem::copy_file(MadeMovie(made), folder() / name);
+        return Out(name);
+    }
+    std::size_t FilesLeft() {
+        return static_cast<std::size_t>(
+            std::distance(std::filesystem::directory_iterator(folder()), {}));
+    }
+};
+
+std::string Program() {
+    return (ProgramFolder() / "cliphost").string();
+}
+
+void ExpectSays(const CommandResult& result, int status, const std::string& words) {
+    EXPECT_EQ(result.status, status) << result.out;
+    EXPECT_NE(result.out.find(words), std::string::npos) << result.out;
+}
+
+TEST_F(ProgramCalls, NeverWriteOverTheMovie) {
+    const auto movie = Copy("prores_with_pcm.mov", "a.mov");
+    const auto before = ReadFile(movie);
+    std::filesystem::create_hard_link(movie, folder() / "link.png");
+    for (const std::string& call :
+         {"describe " + movie + " --aaf " + movie,
+          "describe " + movie + " --aaf " + Out("link.png"), "frame " + movie + " -o " + movie,
+          "audio " + movie + " -o " + movie, "contact " + movie + " -o " + movie,
+          "contact " + movie + " -o " + Out("link.png")}) {
+        ExpectSays(RunCliphost(call), 2, "this is the movie itself");
+        EXPECT_EQ(ReadFile(movie), before) << call;
+    }
+    EXPECT_EQ(FilesLeft(), 2u);
+}
+
+TEST_F(ProgramCalls, GoOnWithTheOtherMoviesAfterOneThatIsBad) {
+    const auto movie = Copy("png.mov", "a.mov");
+    const auto calls = "describe -q " + Out("missing.mov") + " " + movie;
+    ExpectSays(RunCliphost(calls), 1, "missing.mov: there is no such file");
+    ExpectSays(RunCliphost(calls), 1, "1 described, 1 not");
+    ExpectSays(RunCliphost("describe -q " + Out("missing.mov")), 2, "there is no such file");
+    const CommandResult json = RunCommand(Program() + " describe --json " + Out("missing.mov") +
+                                          " " + movie + " 2>/dev/null");
+    EXPECT_EQ(json.status, 1);
+    const Json list = Json::parse(json.out);
+    ASSERT_EQ(list.size(), 2u);
+    EXPECT_TRUE(list[0].contains("problem"));
+    EXPECT_TRUE(list[1].contains("description"));
+}
+
+TEST_F(ProgramCalls, GoOnAfterADescriptionThatCantBeSaved) {
+    const auto first = Copy("png.mov", "a.mov");
+    const auto second = Copy("png.mov", "b.mov");
+    std::filesystem::create_directories(folder() / "out" / "a.aaf");
+    ExpectSays(RunCliphost("describe -q --out-dir " + Out("out") + " " + first + " " + second), 1,
+               "a.aaf: not saved: a folder is there");
+    EXPECT_TRUE(std::filesystem::is_regular_file(folder() / "out" / "b.aaf"));
+}
+
+TEST_F(ProgramCalls, GiveEachDescriptionAFileOfItsOwn) {
+    std::filesystem::create_directory(folder() / "x");
+    const auto movies = Copy("png.mov", "a.mov") + " " + Copy("png.mov", "x/a.mov") + " " +
+                        Copy("png.mov", "a-2.mov");
+    ASSERT_EQ(RunCliphost("describe -q --out-dir " + Out("out") + " " + movies).status, 0);
+    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(folder() / "out"), {}), 3);
+}
+
+TEST_F(ProgramCalls, LeaveAForeignFileOfASimilarNameAlone) {
+    const auto movie = Copy("png.mov", "a.mov");
+    Write(movies::Bytes{'k', 'e', 'e', 'p'}, "a.aaf.new");
+    ASSERT_EQ(RunCliphost("describe -q " + movie + " --aaf " + Out("a.aaf")).status, 0);
+    EXPECT_EQ(ReadFile(folder() / "a.aaf.new").size(), 4u);
+    EXPECT_EQ(FilesLeft(), 3u);
+}
+
+TEST_F(ProgramCalls, SaveDescriptionsAsFilesAlone) {
+    const auto movie = Copy("png.mov", "a.mov");
+    // As a device does, a pipe stands for something that no file may replace.
+    ASSERT_EQ(mkfifo(Out("pipe").c_str(), 0600), 0);
+    ExpectSays(RunCliphost("describe -q " + movie + " --aaf " + Out("pipe")), 2,
+               "not saved: a device is there");
+    EXPECT_TRUE(std::filesystem::is_fifo(folder() / "pipe"));
+    ExpectSays(RunCliphost("describe -q " + movie + " --aaf " + Out("no/a.aaf")), 2,
+               "there is no folder");
+    ExpectSays(RunCliphost("describe -q " + movie + " --out-dir " + movie), 2,
+               "the folder can't be made");
+    EXPECT_EQ(FilesLeft(), 2u);
+}
+
+TEST_F(ProgramCalls, RefuseValuesThatMeanNothing) {
+    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    const auto expectRefused = [](const std::string& call, const std::string& words) {
+        ExpectSays(RunCliphost(call), 2, words);
+    };
+    for (const char* const rate : {"nan", "inf", "0", "-1", "1e300", "x"}) {
+        expectRefused("types --editor-rate " + std::string(rate),
+                      "is no number of frames a second");
+        expectRefused("types --forced-rate " + std::string(rate),
+                      "is no number of frames a second");
+    }
+    for (const char* const number : {"-1", "18446744073709551616", "1.5", "nan"}) {
+        const std::string text = number;
+        const std::string words = "'" + text + "' is no whole number";
+        expectRefused("frame " + movie + " -o - --frame " + text, words);
+        expectRefused("frame " + movie + " -o - --track " + text, words);
+        expectRefused("audio " + movie + " -o - --start " + text, words);
+        expectRefused("audio " + movie + " -o - --count " + text, words);
+        expectRefused("audio " + movie + " -o - --track " + text, words);
+        expectRefused("samples " + movie + " --track " + text, words);
+        expectRefused("types --single-frame-duration " + text, words);
+    }
+    expectRefused("audio " + movie + " -o - --count 0", "from 1 to");
+    expectRefused("frame " + movie + " -o - --frame 18446744073709551615",
+                  "there is no frame 18446744073709551615");
+    for (const char* const time : {"2026-02-29T00:00:00Z", "2026-04-31T00:00:00Z",
+                                   "-001-01-01T00:00:00Z", "\"2026- 1- 1T 0: 0: 0Z\"",
+                                   "2026-01-01T24:00:00Z", "2026-01-01", "0000-01-01T00:00:00Z"}) {
+        expectRefused("describe " + movie + " --pin-time " + time, "not a time");
+    }
+    EXPECT_EQ(RunCliphost("describe -q " + movie + " --pin-time 2024-02-29T23:59:59Z").status, 0);
+    expectRefused("contact " + movie + " -o " + Out("c.jpg"), "'.jpg' is no ending");
+    expectRefused("decribe " + movie, "'decribe' is no verb");
+    EXPECT_EQ(FilesLeft(), 0u);
+}
+
+TEST_F(ProgramCalls, RefuseEmptyTexts) {
+    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    for (const std::string& call :
+         {std::string("describe ''"), "describe " + movie + " --aaf ''",
+          "describe " + movie + " --out-dir ''", "describe " + movie + " --pin-time ''",
+          std::string("scan ''"), std::string("samples ''"), "frame " + movie + " -o ''",
+          "frame " + movie + " -o - --range ''", "frame " + movie + " -o - --format ''",
+          "params " + movie + " --set-xml ''", std::string("types --plugin ''"),
+          std::string("types --aaf-library ''")}) {
+        ExpectSays(RunCliphost(call), 2, "an empty text is no value");
+    }
+}
+
+TEST_F(ProgramCalls, EndARangeWhoseNextFrameWouldBeBeyondAllNumbers) {
+    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    ExpectSays(
+        RunCliphost("frame " + movie + " --range 1::18446744073709551615 -o " + Out("a.raw")), 0,
+        "a.raw: 1 raw frames");
+}
+
+TEST_F(ProgramCalls, TellWhenStandardOutputTakesNothing) {
+    if (!std::filesystem::exists("/dev/full")) {
+        GTEST_SKIP() << "there is no /dev/full";
+    }
+    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    for (const std::string& call :
+         {std::string("types"), std::string("plugin --json"), std::string("--help"),
+          "describe " + movie, "samples --every " + movie, "params --xml values " + movie,
+          "formats --json " + movie}) {
+        ExpectSays(RunCommand(Program() + " " + call + " 2>&1 >/dev/full"), 2,
+                   "standard output: not written: No space left");
+        ExpectSays(RunCommand(Program() + " " + call + " 2>&1 >&-"), 2,
+                   "standard output: not written:");
+    }
+    EXPECT_EQ(RunCommand(Program() + " describe missing.mov 2>/dev/full").status, 2);
+}
+
+// With its number free, the next file opened would be what is printed into.
+TEST_F(ProgramCalls, PrintIntoNoFileWhenStandardStreamsAreClosed) {
+    const auto movie = Copy("prores_with_pcm.mov", "a.mov");
+    ASSERT_EQ(RunCommand(Program() + " audio " + movie + " -o " + Out("open.wav")).status, 0);
+    RunCommand(Program() + " audio " + movie + " -o " + Out("closed.wav") + " <&- >&- 2>&-");
+    EXPECT_EQ(ReadFile(folder() / "closed.wav"), ReadFile(folder() / "open.wav"));
+}
+
+TEST_F(ProgramCalls, GiveValidJsonForNamesThatAreNoUtf8) {
+    std::filesystem::create_directory(folder() / "f\xFF");
+    const auto movie = Copy("png.mov", "f\xFF/b\xFE name.mov");
+    const std::string quoted = "'" + movie + "'";
+    for (const std::string& call :
+         {"scan --json '" + Out("f\xFF") + "'", "describe --json " + quoted,
+          "samples --json " + quoted, "formats --json " + quoted, "params --json " + quoted}) {
+        const CommandResult result = RunCommand(Program() + " " + call);
+        EXPECT_EQ(result.status, 0) << call;
+        EXPECT_TRUE(Json::accept(result.out)) << call << "\n" << result.out;
+    }
+}
+
+TEST_F(ProgramCalls, LeaveNothingBehindWhenInterrupted) {
+    const auto movie = MadeMovie("prores_with_pcm.mov").string();
+    // A raw file is open all the while the frames are read.
+    const CommandResult result = RunCommand(
+        "bash -c 'set -m; " + Program() + " frame " + movie + " --range 0: -o " + Out("a.raw") +
+        " 2>/dev/null & for i in $(seq 2000); do ls " + folder().string() +
+        " | grep -q part && break; sleep 0.005; done; kill -TERM $!; wait $!; echo $?'");
+    EXPECT_TRUE(result.out == "143\n" || result.out == "0\n") << result.out;
+    EXPECT_EQ(FilesLeft(), result.out == "0\n" ? 1u : 0u);
+}
+
+}  // namespace
