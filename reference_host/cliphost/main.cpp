@@ -48,6 +48,9 @@ int OutputStatus(int error, int status) {
 }
 
 int FlushOutput(int status) {
+    if (std::cout.good() && std::ferror(stdout) != 0) {
+        return status;  // it was told where it happened
+    }
     errno = 0;
     std::cout.flush();
     if (std::fflush(stdout) == 0 && std::cout.good()) {

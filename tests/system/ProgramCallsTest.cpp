@@ -176,6 +176,11 @@ TEST_F(ProgramCalls, TellWhenStandardOutputTakesNothing) {
         ExpectSays(RunCommand(Program() + " " + call + " 2>&1 >&-"), 2,
                    "standard output: not written:");
     }
+    // More than is kept back, so that it fails amid the printing.
+    const CommandResult amid = RunCommand(Program() + " samples --every " +
+                                          MadeMovie("pcm_u8.mov").string() + " 2>&1 >/dev/full");
+    EXPECT_EQ(amid.status, 2);
+    EXPECT_EQ(amid.out, "cliphost: standard output: not written: No space left on device\n");
     EXPECT_EQ(RunCommand(Program() + " describe missing.mov 2>/dev/full").status, 2);
 }
 
