@@ -18,8 +18,8 @@ namespace host {
 class AudioReader final : public Component<QTWrapper::IQTAudioReader> {
 public:
     // The stream of each sound track, by the track's number.
-    AudioReader(std::filesystem::path path, std::map<ncfUInt32, int> streams)
-        : path_(std::move(path)), streams_(std::move(streams)) {}
+    AudioReader(std::filesystem::path path, std::map<ncfUInt32, int> streams, bool hasWholeIndex)
+        : path_(std::move(path)), streams_(std::move(streams)), hasWholeIndex_(hasWholeIndex) {}
 
     NCFRESULT ReservedAudioReaderOperation() override { return NCF_E_NOTIMPL; }
     NCFRESULT SetParams(ncfUInt32 track, ncfUInt32 bytesPerSample, ncfUInt8 littleEndian,
@@ -37,6 +37,7 @@ private:
     std::mutex mutex_;
     std::filesystem::path path_;
     std::map<ncfUInt32, int> streams_;
+    bool hasWholeIndex_;
     std::map<ncfUInt32, Track> tracks_;
     std::vector<ncfSInt32> words_;
 };

@@ -75,7 +75,8 @@ NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader)
         if (streams.empty()) {
             return NMA_E_NODATA;
         }
-        *reader = MakeRef<AudioReader>(movie_->Path(), std::move(streams)).Detach();
+        *reader = MakeRef<AudioReader>(movie_->Path(), std::move(streams), movie_->IndexIsWhole())
+                      .Detach();
         return NCF_OK;
     });
 }

@@ -15,7 +15,10 @@ namespace host {
 // presents, and what an edit leaves empty is silence. Nothing is resampled.
 class SoundDecoder {
 public:
-    static std::unique_ptr<SoundDecoder> Open(const std::filesystem::path& path, int stream);
+    // `hasWholeIndex`: the file is a movie whose own time begins at 0. Other
+    // files, and movies in fragments, begin where their first stream does.
+    static std::unique_ptr<SoundDecoder> Open(const std::filesystem::path& path, int stream,
+                                              bool hasWholeIndex);
 
     int Channels() const { return channels_; }
 
@@ -24,14 +27,28 @@ public:
     ncfUInt64 Read(ncfUInt64 place, ncfUInt64 count, std::vector<ncfSInt32>& words);
 
 private:
-    SoundDecoder(InputOwner input, CodecOwner codec, int stream);
+    SoundDecoder(std::filesystem::path path, InputOwner input, CodecOwner codec, int stream,
+                 bool hasWholeIndex);
+
+    // A block whose place is known because all before it were counted.
+    struct KnownBlock {
+        ncfSInt64 time;
+        ncfSInt64 place;
+    };
 
     ncfSInt64 TimeOf(ncfSInt64 place) const;
     ncfSInt64 PlaceOf(ncfSInt64 time) const;
-    void Seek(ncfSInt64 place);
+    void Start(ncfSInt64 place);
+    bool SeekByTime(ncfSInt64 place);
+    bool SeekToKnown(ncfSInt64 place);
+    void Rewind();
+    bool MayDecodeOnTo(ncfSInt64 place) const;
+    ncfSInt64 Preroll() const;
     bool Advance();  // the next decoded block; false at the end
+    bool PlaceBlock();
     bool Feed();
 
+    std::filesystem::path path_;
     InputOwner input_;
     CodecOwner codec_;
     FrameOwner frame_;
@@ -40,13 +57,18 @@ private:
     int channels_;
     ncfSInt64 zeroTime_ = 0;   // of place 0, in time units of the stream
     ncfSInt64 tolerance_ = 1;  // frames that rounding of times may take
+    // Times are coarser than frames: places are counted, not taken from times.
+    bool countsPlaces_ = false;
+    bool leansOnAll_ = false;        // a block comes out right only after all before it
+    std::vector<KnownBlock> known_;  // of those that are counted, in order
     bool isRunning_ = false;
 
     // The block decoded last.
     std::vector<ncfSInt32> block_;
     ncfSInt64 blockStart_ = 0;
     ncfSInt64 blockCount_ = 0;
-    bool isPlaced_ = false;  // the next block follows the last where times agree
+    bool isFromStart_ = false;  // decoding began with the first block
+    bool isPlaced_ = false;     // the next block follows the last where times agree
 };
 
 }  // namespace host

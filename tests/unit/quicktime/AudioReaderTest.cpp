@@ -52,6 +52,7 @@ struct Kind {
     const char* name;
     const char* arguments;
     const char* ending;
+    const char* decoder = "";  // which one to compare with, where there are two
 };
 void PrintTo(const Kind& kind, std::ostream* out) {
     *out << kind.name;
@@ -63,7 +64,8 @@ TEST_P(EverySound, EqualsWhatFfmpegDecodesBitForBit) {
     NEEDS_FFMPEG();
     const MadeMovie movie(kTwoTones + std::string(GetParam().arguments), GetParam().ending);
     for (const bool little : {true, false}) {
-        const Bytes wanted = movie.Decoded(little ? "-map 0:a:0 -f s24le" : "-map 0:a:0 -f s24be");
+        const Bytes wanted = movie.Decoded(little ? "-map 0:a:0 -f s24le" : "-map 0:a:0 -f s24be",
+                                           GetParam().decoder);
         ASSERT_FALSE(wanted.empty());
         const auto reader = OpenSound(movie.Path());
         ASSERT_TRUE(reader);
@@ -108,7 +110,20 @@ INSTANTIATE_TEST_SUITE_P(
         Kind{"F32be", "-c:a pcm_f32be", ".mov"}, Kind{"F64le", "-c:a pcm_f64le", ".mov"},
         Kind{"Aac", "-c:a aac -aac_pns 0", ".mov"}, Kind{"Alac", "-c:a alac", ".m4a"},
         Kind{"Wav", "-c:a pcm_s24le", ".wav"}, Kind{"Aiff", "-c:a pcm_s16be", ".aiff"},
-        Kind{"Flac", "-c:a flac", ".flac"}, Kind{"Au", "-c:a pcm_s16be", ".au"}),
+        Kind{"Flac", "-c:a flac", ".flac"}, Kind{"Au", "-c:a pcm_s16be", ".au"},
+        Kind{"Ima4", "-c:a adpcm_ima_qt", ".mov"}, Kind{"Mp3", "-c:a libmp3lame", ".mp3"},
+        Kind{"Mp3InMov", "-c:a libmp3lame", ".mov"}, Kind{"Mp3InAvi", "-c:a libmp3lame", ".avi"},
+        Kind{"Mp3VbrInAvi", "-c:a libmp3lame -q:a 4", ".avi"},
+        Kind{"PcmInAvi", "-c:a pcm_s16le", ".avi"}, Kind{"AacInTs", "-c:a aac -aac_pns 0", ".ts"},
+        Kind{"Mp2InTs", "-c:a mp2", ".ts", "-c:a mp2float "},
+        Kind{"Mp2InMpg", "-c:a mp2", ".mpg", "-c:a mp2float "},
+        Kind{"AacInMkv", "-c:a aac -aac_pns 0", ".mkv"}, Kind{"FlacInMkv", "-c:a flac", ".mkv"},
+        Kind{"PcmInMkv", "-c:a pcm_s16le", ".mkv"},
+        Kind{"LateMkv", "-c:a pcm_s16le -output_ts_offset 5", ".mkv"},
+        Kind{"Fragmented",
+             "-c:a aac -aac_pns 0 -movflags frag_keyframe+empty_moov+default_base_moof "
+             "-frag_duration 200000",
+             ".mp4"}),
     [](const auto& kind) { return std::string(kind.param.name); });
 
 // The edit list hides the encoder's priming: a click stays in its place.
@@ -151,6 +166,28 @@ TEST(AudioReader, GivesSilenceForAnEmptyEdit) {
     const Bytes wanted = plain.Decoded("-f s24le");
     EXPECT_EQ(std::memcmp(got.data() + 24000 * 3, wanted.data(), 6000 * 3), 0);
     EXPECT_EQ(Sound(*reader, track, 100, 50, channels).size(), 150u);
+}
+
+// Fragments cut from a longer movie begin when their first sample does.
+TEST(AudioReader, BeginsWithTheFirstOfLateFragments) {
+    NEEDS_FFMPEG();
+    const MadeMovie early(
+        "-f lavfi -i sine=d=1:r=48000 -c:a pcm_s16le -frag_duration 200000 -movflags "
+        "frag_keyframe+empty_moov+default_base_moof");
+    Bytes content = early.Content();
+    const char name[] = {'t', 'f', 'd', 't'};
+    auto at = std::search(content.begin(), content.end(), name, name + 4);
+    ASSERT_NE(at, content.end());
+    for (; at != content.end(); at = std::search(at + 4, content.end(), name, name + 4)) {
+        ASSERT_EQ(at[4], 1);  // times of 64 bits
+        at[12] = 1;           // 65536 * 256 samples later
+    }
+    const MadeMovie late(content, ".mov");
+    const auto reader = OpenSound(late.Path());
+    ASSERT_TRUE(reader);
+    ncfUInt32 channels = 0;
+    ASSERT_EQ(reader->SetParams(1, 3, 1, 48000.0, channels), NCF_OK);
+    EXPECT_EQ(Sound(*reader, 1, 0, 48000, 1), early.Decoded("-f s24le"));
 }
 
 TEST(AudioReader, KeepsTheParametersOfEachTrackApart) {

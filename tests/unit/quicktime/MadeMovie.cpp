@@ -68,8 +68,8 @@ Bytes MadeMovie::Content() const {
     return Bytes{std::istreambuf_iterator<char>(stream), std::istreambuf_iterator<char>()};
 }
 
-Bytes MadeMovie::Decoded(const std::string& arguments) const {
-    return OutputOf("ffmpeg -v quiet -i " + path_.string() + " " + arguments + " -");
+Bytes MadeMovie::Decoded(const std::string& arguments, const std::string& before) const {
+    return OutputOf("ffmpeg -v quiet " + before + " -i " + path_.string() + " " + arguments + " -");
 }
 
 std::vector<std::string> MadeMovie::Probed(const std::string& arguments) const {

@@ -29,8 +29,8 @@ public:
     const std::filesystem::path& Path() const { return path_; }
     Bytes Content() const;
     // What the ffmpeg command gives for the file with `arguments` between the
-    // file and the output, which is raw.
-    Bytes Decoded(const std::string& arguments) const;
+    // file and the output, which is raw, and `before` in front of the file.
+    Bytes Decoded(const std::string& arguments, const std::string& before = "") const;
     // Lines that ffprobe prints, such as those of packets.
     std::vector<std::string> Probed(const std::string& arguments) const;
 
