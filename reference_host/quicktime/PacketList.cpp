@@ -39,7 +39,10 @@ std::vector<PacketEntry> FromIndex(AVStream& stream) {
         packets.push_back(packet);
     }
     for (std::size_t i = 0; i + 1 < packets.size(); ++i) {
-        packets[i].duration = packets[i + 1].decodeTime - packets[i].decodeTime;
+        const ncfSInt64 time = packets[i].decodeTime;
+        const ncfSInt64 next = packets[i + 1].decodeTime;
+        const bool areKnown = time != AV_NOPTS_VALUE && next != AV_NOPTS_VALUE;
+        packets[i].duration = areKnown ? next - time : 0;
     }
     if (packets.size() > 1) {
         packets.back().duration = packets[packets.size() - 2].duration;
@@ -110,9 +113,22 @@ void ReadThrough(AVFormatContext& input, int stream, Each each) {
     }
 }
 
-bool IndexSaysAll(const std::vector<PacketEntry>& packets, const AVStream& stream) {
-    return !MayReorder(stream) || std::all_of(packets.begin(), packets.end(),
-                                              [](const PacketEntry& p) { return p.isSync; });
+// Movies without a list of sync samples claim that every one is, reordered or
+// not: the first packets tell.
+constexpr std::size_t kPacketsThatTell = 32;
+
+bool AreAllSync(const std::vector<PacketEntry>& packets) {
+    return std::all_of(packets.begin(), packets.end(),
+                       [](const PacketEntry& packet) { return packet.isSync; });
+}
+
+// Whether both are shown equally long after they are decoded.
+bool IsShownAsLate(const PacketEntry& a, const PacketEntry& b) {
+    const auto isKnown = [](const PacketEntry& packet) {
+        return packet.decodeTime != AV_NOPTS_VALUE && packet.displayTime != AV_NOPTS_VALUE;
+    };
+    return !isKnown(a) || !isKnown(b) ||
+           a.displayTime - a.decodeTime == b.displayTime - b.decodeTime;
 }
 
 }  // namespace
@@ -126,19 +142,22 @@ ncfSInt64 UsableDuration(ncfSInt64 duration) {
 }
 
 std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool indexIsWhole) {
-    std::vector<PacketEntry> packets;
+    std::vector<PacketEntry> indexed;
     if (indexIsWhole) {
-        packets = FromIndex(*input.streams[stream]);
-        if (IndexSaysAll(packets, *input.streams[stream])) {
-            return packets;
+        indexed = FromIndex(*input.streams[stream]);
+        if (!MayReorder(*input.streams[stream])) {
+            return indexed;
         }
-        packets.clear();
     }
+    const bool areAllSync = !indexed.empty() && AreAllSync(indexed);
+    std::vector<PacketEntry> packets;
+    bool isInOrder = areAllSync;
     ReadThrough(input, stream, [&](const PacketEntry& entry) {
         packets.push_back(entry);
-        return true;
+        isInOrder = isInOrder && IsShownAsLate(packets.front(), entry);
+        return !isInOrder || packets.size() < kPacketsThatTell;
     });
-    return packets;
+    return isInOrder ? indexed : packets;
 }
 
 bool AreStoredPlain(const std::filesystem::path& path, int stream, int count) {

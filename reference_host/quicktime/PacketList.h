@@ -37,7 +37,7 @@ ncfSInt64 UsableTime(ncfSInt64 time);
 ncfSInt64 UsableDuration(ncfSInt64 duration);
 
 // The packets of a stream in decode order. Where the container has an index and
-// the codec keeps its pictures in order, the index says all; else the packets
+// the stream keeps its pictures in order, the index says all; else the packets
 // are read through once. `indexIsWhole`: the container's index names all of
 // them. Leaves the input at an unknown place.
 std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool indexIsWhole);

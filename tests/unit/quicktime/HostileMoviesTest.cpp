@@ -4,6 +4,7 @@
 
 #include <random>
 
+#include "tests/support/movies/Movie.h"
 #include "tests/unit/quicktime/AskEverything.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
@@ -42,6 +43,24 @@ TEST(HostileMovies, WithBitsTurnedComeBack) {
         }
         SCOPED_TRACE(i);
         EXPECT_STREQ(AskEverything(MadeMovie(broken, ".mov").Path()), nullptr);
+    }
+}
+
+// Edits of more time than numbers hold.
+TEST(HostileMovies, WithEndlessEmptyEditsComeBack) {
+    for (const std::uint64_t duration :
+         {~std::uint64_t{0} >> 1, std::uint64_t{1} << 61, std::uint64_t{1} << 57}) {
+        for (const bool isSound : {false, true}) {
+            SCOPED_TRACE(duration);
+            movies::Movie movie;
+            movies::VideoFormat picture;
+            picture.codec = "apcn";  // each picture stands alone
+            movie.tracks.push_back(isSound ? movies::SoundTrack(movies::SoundFormat(), 48000)
+                                           : movies::VideoTrack(picture, 10, 25000, 1000));
+            movie.tracks[0].edits = {{duration, -1, 1.0}, {600, 0, 1.0}};
+            EXPECT_STREQ(AskEverything(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path()),
+                         nullptr);
+        }
     }
 }
 

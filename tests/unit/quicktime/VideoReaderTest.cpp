@@ -336,6 +336,34 @@ TEST(VideoReader, NumbersFromTheFirstPictureThatTheEditListShows) {
     EXPECT_TRUE(std::equal(first.begin(), first.end(), shown.begin()));
 }
 
+// Without a list of them all samples count as sync, though they are reordered.
+TEST(VideoReader, NumbersAsShownWhereNoSyncSamplesAreListed) {
+    NEEDS_FFMPEG();
+    const MadeMovie listed(
+        "-f lavfi -i testsrc2=s=96x64:r=25:d=2 -c:v libx264 -bf 2 -g 12 -pix_fmt yuv420p");
+    Bytes content = listed.Content();
+    const char name[] = {'s', 't', 's', 's'};
+    const auto at = std::search(content.begin(), content.end(), name, name + 4);
+    ASSERT_NE(at, content.end());
+    std::copy_n("free", 4, at);
+    const MadeMovie movie(content, ".mov");
+    ncfUInt64 count = 0;
+    const Bytes wanted = AllOf(listed, "2vuy");
+    EXPECT_EQ(AllOf(movie, "2vuy", &count), wanted);
+    ASSERT_EQ(count, 50u);
+    const std::size_t size = wanted.size() / count;
+    const auto reader = OpenVideo(movie.Path(), Code("2vuy"));
+    ASSERT_TRUE(reader);
+    for (const ncfUInt64 number : {40, 3, 17, 49, 0, 11}) {
+        const Bytes one = Picture(*reader, number);
+        ASSERT_EQ(one.size(), size) << number;
+        EXPECT_EQ(std::memcmp(one.data(), wanted.data() + number * size, size), 0) << number;
+    }
+    host::Ref<QTWrapper::IQTWSampleTable> table;
+    ASSERT_EQ(OpenWrapper(movie.Path())->GetSampleTable(table.Out()), NCF_OK);
+    EXPECT_NE(table->HasOutOfOrderFrameDependencies(1), 0);
+}
+
 TEST(VideoReader, ServesAStillPictureInAMovie) {
     NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48 -frames:v 1 -c:v png -pix_fmt rgb24");
