@@ -30,7 +30,7 @@ NCFRESULT AudioReader::SetParams(ncfUInt32 track, ncfUInt32 bytesPerSample, ncfU
     return Guarded([&] {
         Track& entry = tracks_[track];
         if (!entry.decoder) {
-            entry.decoder = SoundDecoder::Open(path_, stream->second, hasWholeIndex_);
+            entry.decoder = EditedSound::Open(path_, stream->second, hasWholeIndex_);
         }
         if (!entry.decoder) {
             return NCF_E_FAIL;

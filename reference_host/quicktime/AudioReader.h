@@ -9,7 +9,7 @@
 
 #include "host_interfaces/quicktime/Readers.h"
 #include "reference_host/framework/Component.h"
-#include "reference_host/quicktime/SoundDecoder.h"
+#include "reference_host/quicktime/EditedSound.h"
 
 namespace host {
 
@@ -18,7 +18,8 @@ namespace host {
 class AudioReader final : public Component<QTWrapper::IQTAudioReader> {
 public:
     // The stream of each sound track, by the track's number.
-    AudioReader(std::filesystem::path path, std::map<ncfUInt32, int> streams, bool hasWholeIndex)
+    AudioReader(std::filesystem::path path, std::map<ncfUInt32, EditedSound::Source> streams,
+                bool hasWholeIndex)
         : path_(std::move(path)), streams_(std::move(streams)), hasWholeIndex_(hasWholeIndex) {}
 
     NCFRESULT ReservedAudioReaderOperation() override { return NCF_E_NOTIMPL; }
@@ -31,12 +32,12 @@ private:
     struct Track {
         int bytesPerSample = 0;  // 0: no parameters yet
         bool littleEndian = false;
-        std::unique_ptr<SoundDecoder> decoder;
+        std::unique_ptr<EditedSound> decoder;
     };
 
     std::mutex mutex_;
     std::filesystem::path path_;
-    std::map<ncfUInt32, int> streams_;
+    std::map<ncfUInt32, EditedSound::Source> streams_;
     bool hasWholeIndex_;
     std::map<ncfUInt32, Track> tracks_;
     std::vector<ncfSInt32> words_;

@@ -13,6 +13,7 @@ constexpr int kDeepest = 8;
 constexpr std::size_t kMostTracks = 65536;
 constexpr ncfUInt32 kMostReferences = 4096;
 constexpr std::size_t kMostDescriptionChanges = 65536;
+constexpr ncfUInt64 kMostEdits = 4096;
 
 constexpr ncfUInt32 Code(const char (&text)[5]) {
     return static_cast<ncfUInt32>(static_cast<unsigned char>(text[0])) << 24 |
@@ -88,6 +89,7 @@ private:
             case Code("minf"):
             case Code("dinf"):
             case Code("stbl"):
+            case Code("edts"):
                 Descend(position, end, depth);
                 return;
             case Code("mvhd"):
@@ -98,6 +100,9 @@ private:
                 return;
             case Code("stsd"):
                 ReadDescriptions(position, end);
+                return;
+            case Code("elst"):
+                ReadEdits(position, end);
                 return;
             case Code("stsc"):
                 ReadChunks(position, end);
@@ -134,6 +139,31 @@ private:
         const bool isLong = bytes[0] == 1;
         out_.tracks.back().id = static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
         out_.tracks.back().duration = isLong ? Number(bytes + 28, 8) : Number(bytes + 20, 4);
+    }
+
+    void ReadEdits(ncfUInt64 position, ncfUInt64 end) {
+        constexpr ncfUInt64 kPlain = 0x10000;
+        ncfUInt8 bytes[20];
+        if (out_.tracks.empty() || end - position < 8 || !Read(position, bytes, 8)) {
+            return;
+        }
+        const bool isLong = bytes[0] == 1;
+        const ncfUInt64 size = isLong ? 20 : 12;
+        const ncfUInt64 count = std::min(Number(bytes + 4, 4), (end - position - 8) / size);
+        std::vector<MovieAtoms::Edit> edits;
+        for (ncfUInt64 i = 0; i < count; ++i) {
+            if (count > kMostEdits ||
+                !Read(position + 8 + size * i, bytes, static_cast<std::size_t>(size)) ||
+                Number(bytes + size - 4, 4) != kPlain) {
+                return;
+            }
+            const ncfUInt64 time = isLong ? Number(bytes + 8, 8) : Number(bytes + 4, 4);
+            edits.push_back(
+                {isLong ? Number(bytes, 8) : Number(bytes, 4),
+                 isLong ? static_cast<ncfSInt64>(time)
+                        : ncfSInt64{static_cast<ncfSInt32>(static_cast<ncfUInt32>(time))}});
+        }
+        out_.tracks.back().edits = std::move(edits);
     }
 
     void ReadDescriptions(ncfUInt64 position, ncfUInt64 end) {

@@ -13,6 +13,10 @@ namespace host {
 // All of it is optional: files of other families and damaged ones give what
 // could be read.
 struct MovieAtoms {
+    struct Edit {
+        ncfUInt64 duration = 0;   // movie time units
+        ncfSInt64 mediaTime = 0;  // below 0: empty
+    };
     struct Track {
         ncfUInt32 id = 0;
         ncfUInt64 duration = 0;  // movie time units
@@ -20,6 +24,7 @@ struct MovieAtoms {
         // Samples, from 0, that have another description than the one before.
         std::vector<ncfUInt64> descriptionChanges;
         bool needsOtherFiles = false;
+        std::vector<Edit> edits;  // none where some do not play as fast as the media
     };
     ncfUInt32 timeScale = 0;  // 0: no movie header was found
     ncfUInt64 duration = 0;

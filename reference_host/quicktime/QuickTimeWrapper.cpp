@@ -66,10 +66,15 @@ NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader)
         return NMA_E_NOTINITIALIZED;
     }
     return Guarded([&] {
-        std::map<ncfUInt32, int> streams;
+        std::map<ncfUInt32, EditedSound::Source> streams;
         for (const auto& [track, stream] : movie_->StreamsByTrack()) {
             if (movie_->IsAudio(track)) {
-                streams[track] = stream;
+                EditedSound::Source& source = streams[track];
+                source.stream = stream;
+                source.timeScale = movie_->Atoms().timeScale;
+                if (const MovieAtoms::Track* const atoms = movie_->FindAtoms(track)) {
+                    source.edits = atoms->edits;
+                }
             }
         }
         if (streams.empty()) {

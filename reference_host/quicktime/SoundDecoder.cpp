@@ -55,9 +55,9 @@ bool IsLinear(const AVCodecParameters& form) {
 }  // namespace
 
 std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& path, int stream,
-                                                 bool hasWholeIndex) {
+                                                 bool hasWholeIndex, InputView view) {
     std::string ignored;
-    InputOwner input = OpenInput(path, InputView::AsPresented, ignored);
+    InputOwner input = OpenInput(path, view, ignored);
     if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
         return nullptr;
     }
@@ -77,12 +77,13 @@ std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& pa
     }
     UseOneStream(*input, stream);
     return std::unique_ptr<SoundDecoder>(
-        new SoundDecoder(path, std::move(input), std::move(codec), stream, hasWholeIndex));
+        new SoundDecoder(path, std::move(input), std::move(codec), stream, hasWholeIndex, view));
 }
 
 SoundDecoder::SoundDecoder(std::filesystem::path path, InputOwner input, CodecOwner codec,
-                           int stream, bool hasWholeIndex)
+                           int stream, bool hasWholeIndex, InputView view)
     : path_(std::move(path)),
+      view_(view),
       input_(std::move(input)),
       codec_(std::move(codec)),
       frame_(av_frame_alloc()),
@@ -121,7 +122,7 @@ ncfSInt64 SoundDecoder::Preroll() const {
 
 void SoundDecoder::Rewind() {
     std::string ignored;
-    InputOwner again = OpenInput(path_, InputView::AsPresented, ignored);
+    InputOwner again = OpenInput(path_, view_, ignored);
     isRunning_ = again && stream_ < static_cast<int>(again->nb_streams);
     if (isRunning_) {
         input_ = std::move(again);

@@ -8,6 +8,7 @@
 
 #include "host_interfaces/framework/ResultCodes.h"
 #include "reference_host/quicktime/AvOwners.h"
+#include "reference_host/quicktime/OpenInput.h"
 
 namespace host {
 
@@ -18,9 +19,12 @@ public:
     // `hasWholeIndex`: the file is a movie whose own time begins at 0. Other
     // files, and movies in fragments, begin where their first stream does.
     static std::unique_ptr<SoundDecoder> Open(const std::filesystem::path& path, int stream,
-                                              bool hasWholeIndex);
+                                              bool hasWholeIndex,
+                                              InputView view = InputView::AsPresented);
 
     int Channels() const { return channels_; }
+    int SampleRate() const { return input_->streams[stream_]->codecpar->sample_rate; }
+    double SecondsOfTimeUnit() const { return av_q2d(input_->streams[stream_]->time_base); }
 
     // `count` frames from `place`, all channels; `words` holds zeros where there
     // is no sound. Gives how many frames reach to the last that there is.
@@ -28,7 +32,7 @@ public:
 
 private:
     SoundDecoder(std::filesystem::path path, InputOwner input, CodecOwner codec, int stream,
-                 bool hasWholeIndex);
+                 bool hasWholeIndex, InputView view);
 
     // A block whose place is known because all before it were counted.
     struct KnownBlock {
@@ -49,6 +53,7 @@ private:
     bool Feed();
 
     std::filesystem::path path_;
+    InputView view_;
     InputOwner input_;
     CodecOwner codec_;
     FrameOwner frame_;

@@ -6,6 +6,7 @@
 #include <cstring>
 #include <random>
 
+#include "tests/support/movies/Movie.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;
@@ -188,6 +189,50 @@ TEST(AudioReader, BeginsWithTheFirstOfLateFragments) {
     ncfUInt32 channels = 0;
     ASSERT_EQ(reader->SetParams(1, 3, 1, 48000.0, channels), NCF_OK);
     EXPECT_EQ(Sound(*reader, 1, 0, 48000, 1), early.Decoded("-f s24le"));
+}
+
+// Pieces that begin and end within packets, with silence between them.
+TEST(AudioReader, PutsThePiecesOfAnEditListTogether) {
+    std::mt19937 random(5);
+    movies::Movie movie;
+    movie.timeScale = 1000;
+    movies::SoundFormat format;
+    format.channels = 1;
+    movies::Track track = movies::SoundTrack(format, 48000);
+    for (int i = 0; i < 96000; ++i) {
+        track.data.push_back(static_cast<std::uint8_t>(random()));
+    }
+    track.edits = {{250, 1000, 1.0}, {101, -1, 1.0}, {250, 30500, 1.0}, {5, 77, 1.0}};
+    movie.tracks.push_back(track);
+    const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+    Bytes wanted;
+    for (const movies::Edit& edit : track.edits) {
+        for (std::uint64_t i = 0; i < edit.duration * 48; ++i) {
+            const auto at = (static_cast<std::size_t>(edit.mediaTime) + i) * 2;
+            const bool isEmpty = edit.mediaTime < 0;
+            wanted.push_back(0);
+            wanted.push_back(isEmpty ? std::uint8_t{0} : track.data[at]);
+            wanted.push_back(isEmpty ? std::uint8_t{0} : track.data[at + 1]);
+        }
+    }
+    const auto reader = OpenSound(file.Path());
+    ASSERT_TRUE(reader);
+    ncfUInt32 channels = 0;
+    ASSERT_EQ(reader->SetParams(1, 3, 1, 48000.0, channels), NCF_OK);
+    const ncfUInt64 frames = wanted.size() / 3;
+    EXPECT_EQ(Sound(*reader, 1, 0, frames, 1), wanted);
+    for (int i = 0; i < 50; ++i) {
+        const ncfUInt64 place = random() % frames;
+        const ncfUInt64 count = std::min<ncfUInt64>(1 + random() % 9000, frames - place);
+        const Bytes piece = Sound(*reader, 1, place, count, 1);
+        ASSERT_EQ(piece.size(), count * 3);
+        ASSERT_EQ(std::memcmp(piece.data(), wanted.data() + place * 3, piece.size()), 0) << place;
+    }
+    ncfUInt64 reached = 0;
+    EXPECT_EQ(Sound(*reader, 1, frames - 4, 10, 1, &reached).size(), 30u);
+    EXPECT_EQ(reached, 4u);
+    EXPECT_TRUE(Sound(*reader, 1, frames, 10, 1).empty());
+    EXPECT_TRUE(Sound(*reader, 1, ~ncfUInt64{0} - 5, 100, 1).empty());
 }
 
 TEST(AudioReader, KeepsTheParametersOfEachTrackApart) {

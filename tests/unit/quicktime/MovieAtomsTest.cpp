@@ -34,6 +34,22 @@ TEST(MovieAtoms, TellWhereTheDescriptionChanges) {
     EXPECT_EQ(atoms.tracks[0].descriptionChanges, (std::vector<ncfUInt64>{5, 12}));
 }
 
+TEST(MovieAtoms, TellEditsOfEitherVersion) {
+    for (const unsigned version : {0u, 1u}) {
+        movies::Movie movie = TwoDescriptions();
+        movie.tracks[0].editVersion = version;
+        movie.tracks[0].edits = {{30, -1, 1.0}, {600, 12, 1.0}};
+        const std::vector<host::MovieAtoms::Edit> edits = Read(movie).tracks.at(0).edits;
+        ASSERT_EQ(edits.size(), 2u);
+        EXPECT_EQ(edits[0].duration, 30u);
+        EXPECT_EQ(edits[0].mediaTime, -1);
+        EXPECT_EQ(edits[1].duration, 600u);
+        EXPECT_EQ(edits[1].mediaTime, 12);
+        movie.tracks[0].edits[1].rate = 2.0;
+        EXPECT_TRUE(Read(movie).tracks.at(0).edits.empty());
+    }
+}
+
 TEST(MovieAtoms, TellNoChangeWithinOneDescription) {
     movies::Movie movie;
     movie.tracks.push_back(movies::VideoTrack(movies::VideoFormat(), 20, 25, 1, 10));
