@@ -58,7 +58,8 @@ TEST(HostileMovies, WithEndlessEmptyEditsComeBack) {
             movie.tracks.push_back(isSound ? movies::SoundTrack(movies::SoundFormat(), 48000)
                                            : movies::VideoTrack(picture, 10, 25000, 1000));
             movie.tracks[0].editVersion = 1;
-            movie.tracks[0].edits = {{duration, -1, 1.0}, {600, 0, 1.0}, {duration, 7, 1.0}};
+            movie.tracks[0].edits = {
+                {60, 0, 1.0}, {duration, -1, 1.0}, {600, 0, 1.0}, {duration, 7, 1.0}};
             EXPECT_STREQ(AskEverything(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path()),
                          nullptr);
         }
