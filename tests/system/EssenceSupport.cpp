@@ -3,20 +3,12 @@
 #include "tests/system/EssenceSupport.h"
 
 #include <gtest/gtest.h>
-#include <sys/wait.h>
 
 #include <cmath>
-#include <cstdio>
 #include <limits>
 #include <sstream>
 
-#include "tests/system/SystemTest.h"
-
 namespace {
-
-std::string Quoted(const std::filesystem::path& path) {
-    return "'" + path.string() + "'";
-}
 
 template <class Number>
 double Ratio(const std::vector<Number>& a, const std::vector<Number>& b, double most) {
@@ -33,26 +25,6 @@ double Ratio(const std::vector<Number>& a, const std::vector<Number>& b, double 
 }
 
 }  // namespace
-
-CommandResult RunCommand(const std::string& command) {
-    CommandResult result;
-    std::FILE* const pipe = popen(command.c_str(), "r");
-    EXPECT_NE(pipe, nullptr) << command;
-    if (!pipe) {
-        return result;
-    }
-    char piece[65536];
-    for (std::size_t got; (got = std::fread(piece, 1, sizeof piece, pipe)) > 0;) {
-        result.out.append(piece, got);
-    }
-    const int status = pclose(pipe);
-    result.status = WIFEXITED(status) ? WEXITSTATUS(status) : 128;
-    return result;
-}
-
-CommandResult RunCliphost(const std::string& arguments) {
-    return RunCommand(Quoted(ProgramFolder() / "cliphost") + " " + arguments + " 2>&1");
-}
 
 EssenceBytes Decoded(const std::filesystem::path& movie, const std::string& arguments) {
     const CommandResult result =

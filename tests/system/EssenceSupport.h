@@ -9,19 +9,11 @@
 
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/FrameReader.h"
+#include "tests/system/Command.h"
 
 // What the essence tests compare with: FFmpeg's own commands over the same file.
 
 using EssenceBytes = std::vector<std::uint8_t>;
-
-// What a command prints, and how it ends; fails the test when it can't run.
-struct CommandResult {
-    int status = -1;
-    std::string out;  // both streams where asked for
-};
-CommandResult RunCommand(const std::string& command);
-// The program under test, with arguments; standard error is in `out` too.
-CommandResult RunCliphost(const std::string& arguments);
 
 // What ffmpeg gives for a movie with arguments between it and the output.
 EssenceBytes Decoded(const std::filesystem::path& movie, const std::string& arguments);

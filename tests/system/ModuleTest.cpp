@@ -4,7 +4,6 @@
 // The module's file, what it registers, and the components that the host makes
 // of it.
 
-#include <cstdio>
 #include <memory>
 
 #include "host_interfaces/media/MediaContainer.h"
@@ -12,29 +11,21 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/util/text/HostText.h"
+#include "tests/system/Command.h"
 #include "tests/system/SystemTest.h"
 
 namespace {
 
-std::string OutputOf(const std::string& command) {
-    const std::unique_ptr<FILE, int (*)(FILE*)> pipe(popen(command.c_str(), "r"), pclose);
-    std::string output;
-    char buffer[4096];
-    for (std::size_t n = 0; pipe && (n = fread(buffer, 1, sizeof buffer, pipe.get())) > 0;) {
-        output.append(buffer, n);
-    }
-    return output;
-}
-
 TEST(ModuleFile, ExportsSixFunctionsAndNothingElse) {
     const auto file = ProgramFolder() / "plugins" / "QuickTimePlugin.nvx";
-    EXPECT_EQ(OutputOf("nm -D --defined-only --format=just-symbols '" + file.string() + "' | sort"),
-              "NCFCanUnloadNow\n"
-              "NCFGetClassFactory\n"
-              "NCFRegisterComponent\n"
-              "NCFRegisterPlugin\n"
-              "NCFShutdown\n"
-              "NCFStartup\n");
+    EXPECT_EQ(
+        RunCommand("nm -D --defined-only --format=just-symbols " + Quoted(file) + " | sort").out,
+        "NCFCanUnloadNow\n"
+        "NCFGetClassFactory\n"
+        "NCFRegisterComponent\n"
+        "NCFRegisterPlugin\n"
+        "NCFShutdown\n"
+        "NCFStartup\n");
 }
 
 class Module : public SystemTest {};

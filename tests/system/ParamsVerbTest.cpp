@@ -4,12 +4,10 @@
 // Parameters on the command line: what the program prints of them, and what
 // their options change in what it lists and writes.
 
-#include <sys/wait.h>
-
-#include <cstdio>
 #include <fstream>
 #include <iterator>
 
+#include "tests/system/Command.h"
 #include "tests/system/ParameterDocuments.h"
 #include "tests/system/SystemTest.h"
 
@@ -20,27 +18,8 @@ using namespace parameter_documents;
 // Interlaced, upper field first, decoded to 8-bit and deeper formats.
 constexpr char kInterlaced[] = "prores_4444_1080i.mov";
 
-struct Ran {
-    int status;
-    std::string output;
-};
-
-Ran Cliphost(const std::string& arguments) {
-    const std::string command =
-        "'" + (ProgramFolder() / "cliphost").string() + "' " + arguments + " 2>&1";
-    FILE* const pipe = popen(command.c_str(), "r");
-    Ran ran{-1, {}};
-    char buffer[4096];
-    for (std::size_t n = 0; pipe && (n = fread(buffer, 1, sizeof buffer, pipe)) > 0;) {
-        ran.output.append(buffer, n);
-    }
-    const int status = pipe ? pclose(pipe) : -1;
-    ran.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    return ran;
-}
-
-Ran Params(const std::string& arguments) {
-    return Cliphost("params " + arguments);
+CommandResult Params(const std::string& arguments) {
+    return RunCliphost("params " + arguments);
 }
 
 class ParamsVerb : public SystemTest {
@@ -52,50 +31,48 @@ protected:
 };
 
 TEST_F(ParamsVerb, PrintsChoicesWithAStarAtTheOneInUse) {
-    const Ran ran = Params(movie + " --set 'Level Remapping=Expand'");
+    const CommandResult ran = Params(movie + " --set 'Level Remapping=Expand'");
     EXPECT_EQ(ran.status, 0);
-    EXPECT_EQ(ran.output, MadeMovie(kInterlaced).string() +
-                              ": Custom\n"
-                              "  Field Ordering (\"Field Ordering In File\")\n"
-                              "      Progressive\n"
-                              "      Interlaced - Odd (upper field first) ordered (default)\n"
-                              "      Interlaced - Even (lower field first) ordered\n"
-                              "    * none of these: 8192\n"
-                              "  Field Layout (\"Field Layout\")\n"
-                              "      Merged\n"
-                              "      Split\n"
-                              "    * none of these: 1 (default)\n"
-                              "  GFX-Video Level (\"Level Remapping\")\n"
-                              "      Do not modify levels (default)\n"
-                              "    * Expand video levels to graphic levels\n"
-                              "      Compress graphic levels to video levels\n");
+    EXPECT_EQ(ran.out, MadeMovie(kInterlaced).string() +
+                           ": Custom\n"
+                           "  Field Ordering (\"Field Ordering In File\")\n"
+                           "      Progressive\n"
+                           "      Interlaced - Odd (upper field first) ordered (default)\n"
+                           "      Interlaced - Even (lower field first) ordered\n"
+                           "    * none of these: 8192\n"
+                           "  Field Layout (\"Field Layout\")\n"
+                           "      Merged\n"
+                           "      Split\n"
+                           "    * none of these: 1 (default)\n"
+                           "  GFX-Video Level (\"Level Remapping\")\n"
+                           "      Do not modify levels (default)\n"
+                           "    * Expand video levels to graphic levels\n"
+                           "      Compress graphic levels to video levels\n");
 }
 
 TEST_F(ParamsVerb, PrintsTheNameOfASetOnOneLineWithoutCommandsToTheTerminal) {
     const auto file =
         WriteText(DocumentXml(SetXml(kSet, "", 1, "One&#10;two&#x9B;2J")), "name.xml");
-    const Ran ran = Params(movie + " --set-xml '" + file.string() + "'");
+    const CommandResult ran = Params(movie + " --set-xml '" + file.string() + "'");
     EXPECT_EQ(ran.status, 0);
-    EXPECT_NE(ran.output.find(": One two 2J\n"), std::string::npos) << ran.output;
+    EXPECT_NE(ran.out.find(": One two 2J\n"), std::string::npos) << ran.out;
 }
 
 TEST_F(ParamsVerb, PrintsDocumentsThatItTakesBack) {
-    const Ran values = Params(movie + " --set 'Field Layout=Split' --xml values");
+    const CommandResult values = Params(movie + " --set 'Field Layout=Split' --xml values");
     EXPECT_EQ(values.status, 0);
-    const auto file = WriteText(values.output, "values.xml");
-    const Ran again = Params(movie + " --set-xml '" + file.string() + "' --xml values");
+    const auto file = WriteText(values.out, "values.xml");
+    const CommandResult again = Params(movie + " --set-xml '" + file.string() + "' --xml values");
     EXPECT_EQ(again.status, 0);
-    EXPECT_EQ(again.output, values.output);
-    const Ran reset = Params(movie + " --set 'Level Remapping=1' --reset --set-xml '" +
-                             file.string() + "' --json");
-    EXPECT_EQ(reset.status, 0) << reset.output;
-    EXPECT_NE(reset.output.find("\"value\": 512,"), std::string::npos) << "reset after the file";
-    EXPECT_NE(reset.output.find("\"value\": 1,\n      \"default\": 16,"), std::string::npos)
+    EXPECT_EQ(again.out, values.out);
+    const CommandResult reset = Params(movie + " --set 'Level Remapping=1' --reset --set-xml '" +
+                                       file.string() + "' --json");
+    EXPECT_EQ(reset.status, 0) << reset.out;
+    EXPECT_NE(reset.out.find("\"value\": 512,"), std::string::npos) << "reset after the file";
+    EXPECT_NE(reset.out.find("\"value\": 1,\n      \"default\": 16,"), std::string::npos)
         << "and before the values";
-    EXPECT_NE(Params(movie + " --xml description").output.find("<parameterInfos>"),
-              std::string::npos);
-    EXPECT_NE(Params(movie + " --xml defaults").output.find("<valueUInt32>512<"),
-              std::string::npos);
+    EXPECT_NE(Params(movie + " --xml description").out.find("<parameterInfos>"), std::string::npos);
+    EXPECT_NE(Params(movie + " --xml defaults").out.find("<valueUInt32>512<"), std::string::npos);
 }
 
 TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
@@ -118,16 +95,15 @@ TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
         {"--xml values --json", 2, "--json"},
     };
     for (const auto& call : kCalls) {
-        const Ran ran = Params(movie + " " + call.arguments);
-        EXPECT_EQ(ran.status, call.status) << call.arguments << "\n" << ran.output;
-        EXPECT_NE(ran.output.find(call.words), std::string::npos) << call.arguments << "\n"
-                                                                  << ran.output;
+        const CommandResult ran = Params(movie + " " + call.arguments);
+        EXPECT_EQ(ran.status, call.status) << call.arguments << "\n" << ran.out;
+        EXPECT_NE(ran.out.find(call.words), std::string::npos) << call.arguments << "\n" << ran.out;
     }
     EXPECT_EQ(Params("/no/such/movie.mov").status, 2);
     const auto text = WriteText("hello", "text.mov");
-    const Ran ran = Params("'" + text.string() + "'");
+    const CommandResult ran = Params("'" + text.string() + "'");
     EXPECT_EQ(ran.status, 1);
-    EXPECT_NE(ran.output.find("text.mov: no parameters: "), std::string::npos) << ran.output;
+    EXPECT_NE(ran.out.find("text.mov: no parameters: "), std::string::npos) << ran.out;
 }
 
 // --- the same options of the verbs that show what follows -------------------------------------
@@ -152,21 +128,21 @@ TEST_F(ParamsVerb, OptionsChangeTheFormatsThatAreListed) {
         {fromFile + " --reset", "field 1920 x 540", "top field first"},
     };
     for (const auto& call : kCalls) {
-        const Ran ran = Cliphost("formats " + movie + " " + call.options);
-        EXPECT_EQ(ran.status, 0) << call.options << "\n" << ran.output;
-        EXPECT_NE(ran.output.find(call.height), std::string::npos) << ran.output;
-        EXPECT_NE(ran.output.find(call.words), std::string::npos) << ran.output;
+        const CommandResult ran = RunCliphost("formats " + movie + " " + call.options);
+        EXPECT_EQ(ran.status, 0) << call.options << "\n" << ran.out;
+        EXPECT_NE(ran.out.find(call.height), std::string::npos) << ran.out;
+        EXPECT_NE(ran.out.find(call.words), std::string::npos) << ran.out;
     }
-    EXPECT_EQ(Cliphost("formats " + movie + " --set 'Volume=11'").status, 2);
+    EXPECT_EQ(RunCliphost("formats " + movie + " --set 'Volume=11'").status, 2);
 }
 
 TEST_F(ParamsVerb, OptionsChangeTheFrameThatIsWritten) {
     const std::string picture = "'" + MadeMovie("png.mov").string() + "'";
     const auto frame = [&](const std::string& arguments) {
         const std::filesystem::path file = folder() / "frame.raw";
-        const Ran ran =
-            Cliphost("frame " + picture + " " + arguments + " -o '" + file.string() + "'");
-        EXPECT_EQ(ran.status, 0) << ran.output;
+        const CommandResult ran =
+            RunCliphost("frame " + picture + " " + arguments + " -o '" + file.string() + "'");
+        EXPECT_EQ(ran.status, 0) << ran.out;
         std::ifstream stream(file, std::ios::binary);
         return std::string((std::istreambuf_iterator<char>(stream)),
                            std::istreambuf_iterator<char>());

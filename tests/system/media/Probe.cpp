@@ -6,29 +6,12 @@
 #include <algorithm>
 #include <cstdio>
 #include <cstdlib>
-#include <memory>
 #include <nlohmann/json.hpp>
 #include <sstream>
 
+#include "tests/system/Command.h"
+
 namespace {
-
-std::string Quoted(const std::string& text) {
-    std::string quoted = "'";
-    for (const char c : text) {
-        quoted += c == '\'' ? std::string("'\\''") : std::string(1, c);
-    }
-    return quoted + "'";
-}
-
-std::string OutputOf(const std::string& command) {
-    const std::unique_ptr<FILE, int (*)(FILE*)> pipe(popen(command.c_str(), "r"), pclose);
-    std::string output;
-    char buffer[4096];
-    for (std::size_t n = 0; pipe && (n = fread(buffer, 1, sizeof buffer, pipe.get())) > 0;) {
-        output.append(buffer, n);
-    }
-    return output;
-}
 
 double Quotient(const std::string& text) {
     double numerator = 0, denominator = 0;
@@ -74,10 +57,11 @@ std::vector<ProbedStream> ProbedFile::Of(const std::string& kind) const {
 }
 
 ProbedFile ProbeFile(const std::filesystem::path& file) {
-    const std::string text = OutputOf(
-        "ffprobe -v quiet -print_format json -show_streams "
-        "-show_format " +
-        Quoted(std::filesystem::absolute(file).string()));
+    const std::string text = RunCommand(
+                                 "ffprobe -v quiet -print_format json -show_streams "
+                                 "-show_format " +
+                                 Quoted(std::filesystem::absolute(file)))
+                                 .out;
     ProbedFile probed;
     const nlohmann::json json = nlohmann::json::parse(text, nullptr, false);
     if (json.is_discarded() || !json.contains("format")) {
@@ -94,8 +78,9 @@ ProbedFile ProbeFile(const std::filesystem::path& file) {
 
 void MeasurePackets(const std::filesystem::path& file, ProbedFile& probed) {
     std::istringstream lines(
-        OutputOf("ffprobe -v quiet -of csv=p=0 -show_entries packet=stream_index,duration_time " +
-                 Quoted(std::filesystem::absolute(file).string())));
+        RunCommand("ffprobe -v quiet -of csv=p=0 -show_entries packet=stream_index,duration_time " +
+                   Quoted(std::filesystem::absolute(file)))
+            .out);
     struct Sum {
         double packets = 0;
         double timed = 0;  // packets whose duration is told

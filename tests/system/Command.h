@@ -1,0 +1,17 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+// What a command prints, and how it ends; fails the test when it can't run.
+struct CommandResult {
+    int status = -1;
+    std::string out;  // both streams where asked for
+};
+CommandResult RunCommand(const std::string& command);
+// The program under test, with arguments; standard error is in `out` too.
+CommandResult RunCliphost(const std::string& arguments);
+// A path as one word of the shell.
+std::string Quoted(const std::filesystem::path& path);
