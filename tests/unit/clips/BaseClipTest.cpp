@@ -171,6 +171,24 @@ TEST_F(BaseClipSound, RoundsThePicturesFigure) {
     EXPECT_EQ(samples, 2943u);  // 2942.94
 }
 
+// 440 pictures last 809308.5 samples, but the samples of one picture are
+// rounded first.
+TEST_F(BaseClipSound, TakesTheSamplesOfOnePictureFirst) {
+    Video().table->numSamples = 440;
+    Video().mediaTimescale = 24000;
+    Video().mediaDuration = 440 * 1001;
+    Video().trackTimescale = 24000;
+    Video().trackDuration = 440 * 1001;
+    Sound().description->rate = 44100.0;
+    Sound().trackDuration = 20000;
+    Load();
+    clip->SetEditRate(EditorSettings());
+    clip->SetMovieLength(EditorSettings());
+    ncfUInt64 samples = 0;
+    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_OK);
+    EXPECT_EQ(samples, 809308u);
+}
+
 TEST_F(BaseClipSound, KeepsShortSoundAsItIs) {
     Sound().trackDuration = 9000;
     ncfUInt64 samples = 0;

@@ -59,7 +59,12 @@ TEST_F(LoadOtherClip, FindsAlphaByEitherCheck) {
         wrapper->alphaByContainer = checks & 1;
         wrapper->alphaByPicture = checks >> 1;
         log->clear();
+        journal.clear();
         LoadOther();
+        EXPECT_EQ(journal.startingWith("wrapper.MovieContainsAlpha"),
+                  (std::vector<std::string>{"wrapper.MovieContainsAlpha import",
+                                            "wrapper.MovieContainsAlpha picture"}))
+            << "both are asked whatever the first one says";
         EXPECT_EQ(other->ShowsAlpha(), checks != 0) << checks;
         EXPECT_EQ(log->count("OtherClip::LoadClipImplMovie has alpha!"), checks != 0) << checks;
     }

@@ -96,6 +96,21 @@ TEST_F(QuickTimeClipAttributeTexts, TakesColourFromTheText) {
     EXPECT_EQ(journal.count("video description.GetVideoColorSpaceDetails"), 0);
 }
 
+TEST_F(QuickTimeClipAttributeTexts, TakesColourFromTheTextBeforeTheParsersMarks) {
+    parser->color = new FakeParserColor(&journal);
+    parser->color->flagA = parser->color->flagB = 0;
+    const ColorDetails details =
+        Color(Descriptor("<MinReference>64</MinReference><MaxReference>940</MaxReference>"
+                         "<TransferCharacteristicUID>01020304-0506-0708-090A-0B0C0D0E0F10"
+                         "</TransferCharacteristicUID>"));
+    EXPECT_TRUE(details.hasVendorMetadata);
+    EXPECT_EQ(details.refBlack, 64);
+    EXPECT_EQ(details.refWhite, 940);
+    EXPECT_TRUE(details.transferCharacteristicUID ==
+                ncfGuid("01020304-0506-0708-090A-0B0C0D0E0F10"));
+    EXPECT_TRUE(journal.startingWith("parser color").empty());
+}
+
 TEST_F(QuickTimeClipAttributeTexts, CannotTellABlackOfZero) {
     const ColorDetails details = Color(Descriptor(
         "<MinReference>0</MinReference><MaxReference>255</MaxReference>" + std::string(kLabel)));

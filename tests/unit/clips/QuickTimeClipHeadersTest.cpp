@@ -481,6 +481,33 @@ TEST_F(QuickTimeClipLoading, WantsProofOfTheFamilysOwnAlpha) {
     EXPECT_FALSE(clip->ShowsAlpha()) << "the count can't be read";
 }
 
+TEST_F(QuickTimeClipLoading, MakesNoAlphaOfACodingAlone) {
+    parser->AddVideoTrack(1);
+    GiveSettings(NCF_OK, 0);
+    Picture().hasAlpha = 0;
+    Picture().dataFormat = 0x4E567832;  // 'NVx2'
+    Picture().alphaCodings = {5};
+    Load();
+    EXPECT_TRUE(clip->IsLoaded());
+    EXPECT_FALSE(clip->ShowsAlpha());
+    EXPECT_FALSE(log->contains("Movie has alpha!"));
+}
+
+TEST_F(QuickTimeClipLoading, ComparesBothLettersOfTheFamilysPrefix) {
+    parser->AddVideoTrack(1);
+    GiveSettings(NCF_OK, 0);
+    Picture().hasAlpha = 1;
+    // 'NWx2', 'MVx2', 'NUx2', 'OVx2', 'nvx2', 'xNV2'
+    for (const ncfUInt32 code :
+         {0x4E577832u, 0x4D567832u, 0x4E557832u, 0x4F567832u, 0x6E767832u, 0x784E5632u}) {
+        Picture().dataFormat = code;
+        journal.clear();
+        Load();
+        EXPECT_TRUE(clip->ShowsAlpha()) << std::hex << code;
+        EXPECT_EQ(journal.count("video description.GetNivoAlphaCodingCount"), 0);
+    }
+}
+
 TEST_F(QuickTimeClipLoading, StopsWhenACodingCannotBeRead) {
     parser->AddVideoTrack(1);
     Picture().dataFormat = 0x4E567832;

@@ -164,6 +164,16 @@ TEST_F(QuickTimeClipPicture, IsProgressiveWithOneField) {
     EXPECT_EQ(Console(4, kProgressiveLine), 1);
 }
 
+TEST_F(QuickTimeClipPicture, IsInterlacedWithAnyCountOfFieldsButOne) {
+    for (const ncfUInt32 fields : {0u, 2u, 3u, 4u}) {
+        Picture().SetFields(fields, true, false);
+        Load();
+        EXPECT_TRUE(clip->IsLoaded());
+        ExpectFields(512, 256);
+        EXPECT_EQ(clip->GetClipParams()->detectedFieldOrder, 512u) << fields;
+    }
+}
+
 TEST_F(QuickTimeClipPicture, TellsTheFourKindsOfInterlacedPictures) {
     struct {
         bool top;

@@ -55,6 +55,14 @@ TEST_F(QuickTimeClipTiming, AveragesAVaryingRate) {
     EXPECT_EQ(RateOf(), (Rational{25, 1}));
 }
 
+// 74.9625 lies on the border between 75 and 75000/1001. A quotient that is
+// taken too early falls on the other side.
+TEST_F(QuickTimeClipTiming, MultipliesBeforeItDividesForTheRate) {
+    LoadVideo();
+    SetMedia(1999, 24000, 640000);
+    EXPECT_EQ(RateOf(), (Rational{75, 1}));
+}
+
 TEST_F(QuickTimeClipTiming, AsksForTheRateInOrder) {
     LoadVideo();
     journal.clear();
@@ -168,6 +176,27 @@ TEST_F(QuickTimeClipTiming, RoundsTheLengthOfAPictureTrack) {
     EXPECT_EQ(LengthOf(), 309u);
     EXPECT_EQ(log->count("BaseClip::SetMovieLengthmovie_length[in_video_samples]: 309"), 1);
     EXPECT_EQ(log->count("QuickTimeClip::SetAVMovieLengthtrack is not linear!"), 1);
+}
+
+// 348/600 of a second is 14.5 frames, but the seconds are rounded first.
+TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfAPictureTrack) {
+    LoadVideo();
+    SetMedia(25, 1, 1);
+    RateOf();
+    Video().linear = 1;
+    Video().trackTimescale = 600;
+    Video().trackDuration = 348;
+    EXPECT_EQ(LengthOf(), 14u);
+}
+
+// 696/600 of a second is 29 frames, but the seconds are rounded first.
+TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfSoundOnly) {
+    parser->AddAudioTrack(1);
+    Load();
+    RateOf(Settings(25.0));
+    parser->duration = 696;
+    parser->timeScale = 600;
+    EXPECT_EQ(LengthOf(), 28u);
 }
 
 TEST_F(QuickTimeClipTiming, CutsTheLengthOfSoundOnly) {
@@ -293,6 +322,24 @@ TEST_F(QuickTimeClipTiming, CountsTheSamplesOfASoundTrack) {
     EXPECT_EQ(samples, 1090u);  // 1089.5
     EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(99, &samples), NCF_E_NOTFOUND);
     EXPECT_EQ(samples, 0u);
+}
+
+// 23/600 of a second is 1690.5 samples, but the seconds are rounded first.
+TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheSamplesOfASoundTrack) {
+    parser->AddAudioTrack(2);
+    Load();
+    FakeAudioTrack& track = *parser->audioTracks[0];
+    track.description->rate = 44100.0;
+    track.trackDuration = 23;
+    parser->timeScale = 600;
+    ncfUInt64 samples = 0;
+    EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(2, &samples), NCF_OK);
+    EXPECT_EQ(samples, 1690u);
+    track.mediaDuration = 23;
+    track.mediaTimescale = 600;
+    samples = 0;
+    EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(2, &samples), NCF_OK);
+    EXPECT_EQ(samples, 1690u);
 }
 
 TEST_F(QuickTimeClipTiming, ReachesBeyondTheSignedRangeInSamples) {

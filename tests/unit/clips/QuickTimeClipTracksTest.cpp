@@ -69,6 +69,24 @@ TEST_F(QuickTimeClipTracks, DoesNotFindWhatIsNotThere) {
     EXPECT_EQ(id, 77u);
 }
 
+// The ids are 2, 3, 4, 5, 8 and 10; the next one above stands for none of them.
+TEST_F(QuickTimeClipTracks, DoesNotTakeANeighbourForAnIdThatItLacks) {
+    LoadMany();
+    for (const ncfUInt32 id : {0u, 1u, 6u, 7u, 9u, 11u}) {
+        ncfUInt32 type = 77;
+        NCFSmartPtr<ITrackInfo> any;
+        NCFSmartPtr<IAudioTrackInfo> audio;
+        NCFSmartPtr<IVideoTrackInfo> video;
+        NCFSmartPtr<IQTSampleTable> table;
+        EXPECT_EQ(clip->GetTrackType(id, &type), NCF_E_NOTFOUND) << id;
+        EXPECT_EQ(type, 77u);
+        EXPECT_EQ(clip->GetTrackInfo(id, any.outArg()), NCF_E_NOTFOUND) << id;
+        EXPECT_EQ(clip->GetAudioTrack(id, audio.outArg()), NCF_E_NOTFOUND) << id;
+        EXPECT_EQ(clip->GetVideoTrack(id, video.outArg()), NCF_E_NOTFOUND) << id;
+        EXPECT_EQ(clip->GetSampleTable(id, table.outArg()), NCF_E_NOTFOUND) << id;
+    }
+}
+
 TEST_F(QuickTimeClipTracks, TellsTheKindOfATrack) {
     LoadMany();
     ncfUInt32 type = 99;

@@ -183,6 +183,28 @@ TEST_F(OtherClipPolicy, ProvidesSoundThatTheBaseRuleRefuses) {
     EXPECT_EQ(journal.count("wrapper.MovieTrackDurationIssues"), 0);
 }
 
+TEST_F(OtherClipPolicy, LooksAtSoundInOneOrder) {
+    wrapper->selfContained = 0;
+    wrapper->formatID = 0x61616320;
+    wrapper->soundBits = 32;
+    wrapper->soundIssue = 1;
+    const auto refusal = [this] {
+        Forget();
+        EXPECT_EQ(other->IsAudioSampleProviderMedia(2, &samples), 0);
+        EXPECT_EQ(host->console().lines().size(), 1u);
+        return host->console().lines().at(0).text;
+    };
+    EXPECT_EQ(refusal(), "The movie is not self contained.");
+    wrapper->selfContained = 1;
+    EXPECT_EQ(refusal(), "The FOURCC audio code of aac  is not natively supported.");
+    wrapper->formatID = kFormatLPCM;
+    EXPECT_EQ(refusal(),
+              "An audio bit rate of 32 was found but only bit rates of 16 and 24 are natively "
+              "supported.");
+    wrapper->soundBits = 16;
+    EXPECT_EQ(refusal(), "MovieTrackDurationIssues found.\n");
+}
+
 TEST_F(OtherClipPolicy, HandsFailuresAboutSoundOn) {
     EXPECT_EQ(other->IsAudioSampleProviderMedia(1, &samples), NCF_E_NOTFOUND);
     EXPECT_EQ(

@@ -99,6 +99,33 @@ TEST_F(SampleProviderPolicy, ProvidesPicturesThatShowAlpha) {
     ExpectReason("QuickTimeClip::IsVideoSampleProviderMedia", "The movie contains alpha.");
 }
 
+// The first reason that applies is the one that is told, and nothing behind it
+// is asked.
+TEST_F(SampleProviderPolicy, LooksAtThePictureInOneOrder) {
+    GiveSettings(NCF_OK, 0);
+    Picture().hasAlpha = 1;
+    Load();
+    parser->selfContained = 0;
+    Video().descriptionCount = 2;
+    parser->AddVideoTrack(9);
+    const auto refusal = [this] {
+        host->console().clear();
+        EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), 0);
+        EXPECT_EQ(host->console().lines().size(), 1u);
+        EXPECT_EQ(retriever.asked, nullptr);
+        return host->console().lines().at(0).text;
+    };
+    EXPECT_EQ(refusal(), "The movie is not self contained.");
+    parser->selfContained = 1;
+    EXPECT_EQ(refusal(),
+              "The movie contains video track with more than one video image description.");
+    Video().descriptionCount = 1;
+    EXPECT_EQ(refusal(), "The movie contains more than 1 video track.");
+    parser->videoTracks.back()->Release();
+    parser->videoTracks.pop_back();
+    EXPECT_EQ(refusal(), "The movie contains alpha.");
+}
+
 TEST_F(SampleProviderPolicy, HandsFailuresAboutThePictureOn) {
     Video().results["GetSampleDescriptionCount"] = NCF_E_ABORT;
     EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), NCF_E_ABORT);
@@ -173,6 +200,34 @@ TEST_F(SampleProviderPolicy, ProvidesSoundThatPlaysAPartOfItsMedia) {
     EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
     ExpectReason("QuickTimeClip::IsAudioSampleProviderMedia",
                  "The audio track length doesn't match corresponding media length.");
+}
+
+TEST_F(SampleProviderPolicy, LooksAtSoundInOneOrder) {
+    parser->selfContained = 0;
+    Sound().description->lpcm = 0;
+    Sound().description->bits = 32;
+    Sound().proportional = 0;
+    Sound().results["HasConstantSampleRate"] = 1;
+    Sound().trackDuration = 9999;
+    const auto refusal = [this] {
+        host->console().clear();
+        EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), 0);
+        EXPECT_LE(host->console().lines().size(), 1u);
+        return host->console().lines().empty() ? std::string() : host->console().lines().at(0).text;
+    };
+    EXPECT_EQ(refusal(), "The movie is not self contained.");
+    parser->selfContained = 1;
+    EXPECT_EQ(refusal(), "") << "compressed sound has no reason";
+    Sound().description->lpcm = 1;
+    EXPECT_EQ(refusal(),
+              "An audio bit rate of 32 was found but only bit rates of 16 and 24 are natively "
+              "supported.");
+    Sound().description->bits = 24;
+    EXPECT_EQ(refusal(), "The audio track contains non-trivial edit list(s).");
+    Sound().proportional = 1;
+    EXPECT_EQ(refusal(), "The audio track contains variable sample size.");
+    Sound().results.clear();
+    EXPECT_EQ(refusal(), "The audio track length doesn't match corresponding media length.");
 }
 
 TEST_F(SampleProviderPolicy, HandsFailuresAboutSoundOn) {
