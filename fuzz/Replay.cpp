@@ -2,14 +2,18 @@
 // SPDX-License-Identifier: MIT
 
 // Runs a fuzz target over every file of the folders and files named on the
-// command line: what was found once is tried at every test run.
+// command line: what was found once is tried at every test run, within the
+// limits of a run.
 
 #include <cstdint>
 #include <cstdio>
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <vector>
+
+#include "fuzz/support/RunLimits.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size);
 
@@ -20,6 +24,11 @@ void Replay(const std::filesystem::path& file) {
     const std::vector<char> bytes((std::istreambuf_iterator<char>(stream)),
                                   std::istreambuf_iterator<char>());
     LLVMFuzzerTestOneInput(reinterpret_cast<const std::uint8_t*>(bytes.data()), bytes.size());
+    const std::size_t peak = fuzz::PeakMegabytes();
+    if (fuzz::LimitsCount() && peak > fuzz::kMostMegabytes) {
+        std::fprintf(stderr, "%s: %zu MB of memory\n", file.c_str(), peak);
+        std::exit(1);
+    }
 }
 
 }  // namespace

@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "fuzz/support/RunLimits.h"
 #include "reference_host/aaf/model/ClassRegistry.h"
 #include "reference_host/aaf/model/Model.h"
 #include "reference_host/aaf/stored/ModelReader.h"
@@ -31,6 +32,7 @@ void checkTree(const StoredObject& tree) {
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     static const aaf::ClassRegistry classes;
+    const fuzz::TimeLimit limit;
     try {
         const StoredObject tree = readTree(Bytes(data, data + size));
         checkTree(tree);

@@ -5,6 +5,7 @@
 
 #include <string>
 
+#include "fuzz/support/RunLimits.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/framework/Host.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
@@ -17,6 +18,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         NMAInitialize(&made->factory());
         return made;
     }();
+    const fuzz::TimeLimit limit;
     const std::string text(reinterpret_cast<const char*>(data), size);
     NCFRESULT loaded = NCF_OK;
     ParseHelperFunctions::QTAttributesXMLParser parser(

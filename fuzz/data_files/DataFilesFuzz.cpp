@@ -12,6 +12,7 @@
 #include <random>
 #include <set>
 
+#include "fuzz/support/RunLimits.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/framework/Host.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
@@ -94,6 +95,7 @@ void ReadMapper(const NMAString& file) {
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    const fuzz::TimeLimit limit;
     Factory();
     const NMAString& file = TheFile(data, size);
     for (void (*read)(const NMAString&) : {ReadInfos, ReadMapper}) {

@@ -7,11 +7,13 @@
 #include <cstdio>
 #include <cstdlib>
 
+#include "fuzz/support/RunLimits.h"
 #include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "tests/unit/header_parser/VisitEverything.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    const fuzz::TimeLimit limit;
     const auto parser = host::MakeRef<header_parser::QTParser>();
     ncfUInt32 passes = 0;
     if (header_parser::ReadHeaders(*parser, data, size, &passes) == NCF_OK) {

@@ -7,6 +7,8 @@
 
 #include <cstdlib>
 
+#include "fuzz/support/ModuleSession.h"
+#include "fuzz/support/RunLimits.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "host_interfaces/parameters/ParametersXML.h"
 #include "reference_host/cliphost/Describe.h"
@@ -38,12 +40,9 @@ NCFRESULT Set(INCFParametersXML& parameters, const std::string& xml) {
 class Clip {
 public:
     Clip() {
-        cliphost::SessionOptions options;
-        options.programFolder =
-            std::filesystem::read_symlink("/proc/self/exe").parent_path().parent_path();
-        session_ = new cliphost::Session(options);
         host::Ref<NMA::IMediaContainer3> container;
-        Require(cliphost::OpenContainer(*session_, CLIPHOST_FUZZ_MOVIE, container) == NCF_OK);
+        Require(cliphost::OpenContainer(fuzz::TheSession(), CLIPHOST_FUZZ_MOVIE, container) ==
+                NCF_OK);
         Require(container->GetSampleMapping(mapping_.Out()) == NCF_OK);
         // The first change makes what the clip then keeps.
         const auto parameters = Ask();
@@ -56,10 +55,9 @@ public:
         return parameters;
     }
     const std::string& defaults() const { return defaults_; }
-    void ForgetNotices() { session_->TakeNotices(); }
+    void ForgetNotices() { fuzz::TheSession().TakeNotices(); }
 
 private:
-    cliphost::Session* session_;  // lives as long as the process
     host::Ref<NMA::ISampleMapping> mapping_;
     std::string defaults_;
 };
@@ -68,6 +66,7 @@ private:
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     static Clip& clip = *new Clip;
+    const fuzz::TimeLimit limit;
     const std::int64_t before = host::LiveObjectCount();
     const std::string bytes(reinterpret_cast<const char*>(data), size);
     {

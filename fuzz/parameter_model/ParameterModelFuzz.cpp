@@ -8,6 +8,7 @@
 #include <string>
 
 #include "fuzz/parameter_model/ViewWalk.h"
+#include "fuzz/support/RunLimits.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/framework/Host.h"
 #include "reference_host/framework/String.h"
@@ -64,6 +65,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         NMAInitialize(&made->factory());
         return made;
     }();
+    const fuzz::TimeLimit limit;
     const std::string_view bytes(reinterpret_cast<const char*>(data), size);
     const auto text = host::MakeString(bytes);
     const auto parameters = host::MakeRef<Parameters>(text.get());

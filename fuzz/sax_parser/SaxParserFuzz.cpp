@@ -7,6 +7,7 @@
 #include <cstdlib>
 #include <string>
 
+#include "fuzz/support/RunLimits.h"
 #include "reference_host/xml/EventReader.h"
 
 namespace {
@@ -34,6 +35,7 @@ private:
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    const fuzz::TimeLimit limit;
     if (size == 0) {
         return 0;
     }

@@ -6,6 +6,7 @@
 #include <cstdlib>
 #include <string_view>
 
+#include "fuzz/support/RunLimits.h"
 #include "reference_host/framework/String.h"
 #include "reference_host/xml/XmlDocument.h"
 
@@ -45,6 +46,7 @@ void Walk(IXmlNode& node, int depth) {
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    const fuzz::TimeLimit limit;
     const std::int64_t before = host::LiveObjectCount();
     {
         const auto document = host::MakeRef<host::XmlDocument>();

@@ -1,0 +1,26 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <string>
+
+namespace fuzz {
+
+// A file for inputs of what opens files by their names: one for the process,
+// gone with it.
+class InputFile {
+public:
+    explicit InputFile(const std::string& extension);
+    ~InputFile();
+    InputFile(const InputFile&) = delete;
+    InputFile& operator=(const InputFile&) = delete;
+
+    const std::filesystem::path& Hold(const std::uint8_t* data, std::size_t size) const;
+
+private:
+    std::filesystem::path path_;
+};
+
+}  // namespace fuzz
