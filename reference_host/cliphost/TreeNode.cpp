@@ -7,6 +7,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include "reference_host/util/text/Printable.h"
+
 namespace cliphost {
 namespace {
 
@@ -26,33 +28,14 @@ nlohmann::ordered_json JsonOf(const TreeNode& node) {
     return json;
 }
 
-constexpr std::size_t kLineWidth = 120;
-
-std::string OneLine(const std::vector<TreeNode::Fact>& facts) {
-    std::string line;
-    for (const TreeNode::Fact& fact : facts) {
-        line += fmt::format("{}{} {}", line.empty() ? "  " : ", ", fact.name, fact.value);
-    }
-    return line;
-}
-
-// A node's facts stand behind its title where a line holds them, else below it.
-// A part that is alone stands behind the name of its property.
+// A line for the title and one for each fact, however long: trees of one shape
+// have their facts on the same lines, and a change of one is a change of its line
+// alone. A part that is alone stands behind the name of its property.
 void Write(const TreeNode& node, int indent, const std::string& property, std::string& out) {
     const std::string margin(static_cast<std::size_t>(indent) * 2, ' ');
-    const std::string head = margin + property + node.title;
-    const std::string facts = OneLine(node.facts);
-    if (head.size() + facts.size() <= kLineWidth) {
-        out += head + facts + "\n";
-    } else {
-        out += head + "\n";
-        std::size_t widest = 0;
-        for (const TreeNode::Fact& fact : node.facts) {
-            widest = std::max(widest, fact.name.size());
-        }
-        for (const TreeNode::Fact& fact : node.facts) {
-            out += fmt::format("{}    {:<{}}  {}\n", margin, fact.name, widest, fact.value);
-        }
+    out += fmt::format("{}{}{}\n", margin, property, node.title);
+    for (const TreeNode::Fact& fact : node.facts) {
+        out += fmt::format("{}  {} = {}\n", margin, fact.name, host::text::Printable(fact.value));
     }
     for (const TreeNode::Branch& branch : node.branches) {
         if (branch.nodes.size() == 1) {

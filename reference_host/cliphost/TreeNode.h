@@ -25,7 +25,7 @@ struct TreeNode {
     std::vector<Branch> branches;
 };
 
-// Indented lines, one for each fact.
+// Indented lines, one for each fact whatever it holds.
 std::string ToText(const TreeNode& node, int indent = 0);
 // The same as JSON text.
 std::string ToJson(const TreeNode& node, int indent = 2);

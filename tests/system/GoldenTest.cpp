@@ -25,7 +25,7 @@ std::string Normalised(std::string text) {
     };
     replace("file:///[^\"]*/", "file:///FOLDER/");
     replace("(umid:060a2b34\\.01010101\\.01010f00\\.13[0-9a-f]{6})\\.[0-9a-f.]{35}", "$1.MATERIAL");
-    replace("(CreationTime|LastModified)  [0-9T:.Z-]+", "$1  DATE");
+    replace("(CreationTime|LastModified) = [0-9T:.Z-]+", "$1 = DATE");
     return text;
 }
 
@@ -72,14 +72,29 @@ INSTANTIATE_TEST_SUITE_P(
                     GoldenMovie{"rotated_270.mov", false}),
     [](const auto& test) { return std::filesystem::path(test.param.movie).stem().string(); });
 
+// Where a checkout lies must change nothing but the path itself.
+class GoldenFolders : public SystemTest {};
+
+TEST_F(GoldenFolders, TreeHasTheSameLinesHoweverLongThePathIs) {
+    const auto deep = folder() / std::string(120, 'a') / std::string(120, 'b');
+    std::filesystem::create_directories(deep);
+    const auto copy = deep / "png.mov";
+    std::filesystem::copy_file(MadeMovie("png_alpha.mov"), copy);
+    std::filesystem::copy_file(MadeMovie("png_alpha.mov"), folder() / "png.mov");
+    const auto textOf = [this](const std::filesystem::path& movie) {
+        return Normalised(cliphost::ToReadableText(Describe(movie)));
+    };
+    EXPECT_EQ(textOf(copy), textOf(folder() / "png.mov"));
+}
+
 // A check that can't tell two movies apart would be none.
 TEST(GoldenText, KeepsWhatMattersWhenNormalised) {
-    EXPECT_EQ(Normalised("URLString \"file:///a/b c/png.mov\""),
-              "URLString \"file:///FOLDER/png.mov\"");
+    EXPECT_EQ(Normalised("URLString = \"file:///a/b c/png.mov\""),
+              "URLString = \"file:///FOLDER/png.mov\"");
     EXPECT_EQ(Normalised("urn:smpte:umid:060a2b34.01010101.01010f00.13b10000.b909078d.134e66eb."
                          "d4514720.17efc229"),
               "urn:smpte:umid:060a2b34.01010101.01010f00.13b10000.MATERIAL");
-    EXPECT_EQ(Normalised("StoredWidth 720"), "StoredWidth 720");
+    EXPECT_EQ(Normalised("StoredWidth = 720"), "StoredWidth = 720");
 }
 
 }  // namespace

@@ -21,19 +21,27 @@ TreeNode Mob() {
 
 }  // namespace
 
-TEST(TreeNode, ShowsFactsBehindTitlesAndPartsBelow) {
+TEST(TreeNode, ShowsEachFactOnItsLineAndPartsBelow) {
     EXPECT_EQ(ToText(Mob()),
-              "Mob  Name \"clip\", Length 5\n"
+              "Mob\n"
+              "  Name = \"clip\"\n"
+              "  Length = 5\n"
               "  Slots:\n"
-              "    Slot  Id 1\n"
-              "    Slot  Id 2\n"
+              "    Slot\n"
+              "      Id = 1\n"
+              "    Slot\n"
+              "      Id = 2\n"
               "  Descriptor: Picture\n");
 }
 
-TEST(TreeNode, ShowsFactsInLinesWhereOneIsTooShort) {
-    TreeNode node{"Mob", {{"A", std::string(80, 'x')}, {"Long", std::string(80, 'y')}}, {}};
-    EXPECT_EQ(ToText(node, 1), "  Mob\n      A     " + std::string(80, 'x') + "\n      Long  " +
-                                   std::string(80, 'y') + "\n");
+TEST(TreeNode, BreaksNoLineForTheLengthOfAFact) {
+    const TreeNode node{"Mob", {{"A", std::string(800, 'x')}, {"Long", "y"}}, {}};
+    EXPECT_EQ(ToText(node, 1), "  Mob\n    A = " + std::string(800, 'x') + "\n    Long = y\n");
+}
+
+TEST(TreeNode, KeepsAFactOnOneLineThatHoldsLineEnds) {
+    const TreeNode node{"Mob", {{"Name", "\"a\nb\x1B[2J\""}}, {}};
+    EXPECT_EQ(ToText(node), "Mob\n  Name = \"a\\nb\\x1B[2J\"\n");
 }
 
 TEST(TreeNode, IsJsonWithTheSameNames) {
