@@ -88,7 +88,7 @@ std::string WordsFor(const ImageFormat& format) {
     Append(text, kSpaces, format.colorSpace);
     Append(text, kRanges, format.range);
     Append(text, kFields, format.fieldOrder);
-    if (format.fieldOrder != kProgressive) {
+    if (format.fieldOrder != kProgressive || format.frameLayout == kSplit) {
         Append(text, kFrameLayouts, format.frameLayout);
     }
     return text;

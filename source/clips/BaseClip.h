@@ -167,8 +167,9 @@ protected:
     NCFRESULT GetEditRateBase(Rational* editRate) const;
 
     // Rules of field order and layout that both kinds of clip apply to what
-    // their movie says.
+    // their movie says, and the user's choice over that.
     void ApplyFieldDetails(bool interlaced, bool topFieldFirst, bool split);
+    void ApplyUsersFields();
     // Field order and layout by the size of the picture alone.
     void ApplySizeBasedFieldDefault(ncfUInt32 width, ncfUInt32 height);
 

@@ -46,12 +46,15 @@ void BaseClip::ApplyFieldDetails(bool interlaced, bool topFieldFirst, bool split
         bufferLineOrientation_ = 1;
         console_->Write(4,
                         "QueryVideoDescBufferDetails says we are full progressive and merged \n");
-        return;
+    } else {
+        temporalFieldOrder_ = topFieldFirst ? kTopFieldFirst : kBottomFieldFirst;
+        clipParams_.detectedFieldOrder = temporalFieldOrder_;
+        console_->Write(4, "%s", InterlacedText(topFieldFirst, split));
     }
-    temporalFieldOrder_ = topFieldFirst ? kTopFieldFirst : kBottomFieldFirst;
-    clipParams_.detectedFieldOrder = temporalFieldOrder_;
-    console_->Write(4, "%s", InterlacedText(topFieldFirst, split));
+    ApplyUsersFields();
+}
 
+void BaseClip::ApplyUsersFields() {
     const ncfUInt32 userOrder = clipParams_.fieldOrderInFile;
     const ncfUInt32 userLayout = clipParams_.fieldLayout;
     if (userOrder == kProgressive) {

@@ -216,6 +216,33 @@ TEST_F(Parameters, ChangeTheOrderAndLayoutOfTheFormats) {
     }
 }
 
+TEST_F(Parameters, ChangeTheOrderAndLayoutOfProgressiveMovies) {
+    for (const char* const movie : {"h264_rec709.mov", CLIPHOST_TYPE_FILES "/fragmented.mp4"}) {
+        const struct {
+            std::vector<std::string> assignments;
+            ncfUInt32 order;
+            ncfUInt32 layout;
+        } kChanges[] = {
+            {{}, 256, 256},
+            {{"Field Ordering=512"}, 512, 256},
+            {{"Field Ordering=4096", "Field Layout=Split"}, 4096, 512},
+            {{"Field Ordering=Progressive", "Field Layout=Split"}, 256, 256},
+            {{"Field Layout=Split"}, 256, 512},
+        };
+        for (const auto& change : kChanges) {
+            SCOPED_TRACE(movie + std::string(" ") +
+                         (change.assignments.empty() ? "as it is" : change.assignments[0]));
+            Open(movie);
+            parameters->Assign(change.assignments);
+            const std::vector<Format> formats = Formats();
+            ASSERT_FALSE(formats.empty());
+            for (const Format& format : formats) {
+                EXPECT_EQ(format, (Format{format.pixels, change.order, change.layout}));
+            }
+        }
+    }
+}
+
 TEST_F(Parameters, ChangeTheHeightOfWhatIsDelivered) {
     Open(kInterlaced);
     const ncfUInt32 field = FrameHeight();

@@ -53,6 +53,10 @@ TEST(ImageFormats, SayInWordsWhatTheirNumbersMean) {
     EXPECT_EQ(WordsFor(fields),
               "8-bit R'G'B' 4:4:4:4, bytes B G R A, full range, interlaced, bottom field first, "
               "each field by itself");
+    fields.fieldOrder = format::kProgressive;
+    EXPECT_EQ(WordsFor(fields),
+              "8-bit R'G'B' 4:4:4:4, bytes B G R A, full range, progressive, each field by itself")
+        << "a layout can be chosen without an order";
     EXPECT_NE(WordsFor(kUnknown).find("not known"), std::string::npos);
 }
 

@@ -260,6 +260,14 @@ TEST_F(OtherClipPicture, LaysTheUsersChoiceOverTheDefaultOfTheSize) {
     ExpectFields(FieldsOf(*other), 4096, 256, 4096);
 }
 
+TEST_F(OtherClipPicture, LaysTheUsersChoiceOverProgressivePicturesToo) {
+    LoadWithoutFields(720, 576);
+    other->GetClipParams()->fieldOrderInFile = 4096;
+    other->GetClipParams()->fieldLayout = 3;
+    EXPECT_EQ(other->SetFieldLayoutDetails(), NCF_OK);
+    ExpectFields(FieldsOf(*other), 4096, 512, 256);
+}
+
 TEST_F(OtherClipPicture, HandsOtherFailuresAboutFieldsOn) {
     wrapper->results["QueryVideoDescBufferDetails"] = NCF_E_ABORT;
     wrapper->AddPicture(1);

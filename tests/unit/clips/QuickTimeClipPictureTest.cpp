@@ -237,12 +237,29 @@ TEST_F(QuickTimeClipPicture, LetsTheUserTurnTheFieldsRound) {
     }
 }
 
-TEST_F(QuickTimeClipPicture, IgnoresTheUsersChoiceForProgressivePictures) {
+TEST_F(QuickTimeClipPicture, LaysTheUsersChoiceOverProgressivePicturesToo) {
+    struct {
+        ncfUInt32 order;
+        ncfUInt32 layout;
+        ncfUInt32 expectedOrder;
+        ncfUInt32 expectedLayout;
+    } const kChoices[] = {
+        {256, 3, 256, 256},   {512, 1, 512, 256},  {512, 2, 512, 256},
+        {4096, 3, 4096, 512}, {8192, 1, 256, 256},  // nothing chosen
+        {8192, 2, 256, 256},  {8192, 3, 256, 512}, {7, 3, 256, 512},
+    };
     Load();
-    clip->GetClipParams()->fieldOrderInFile = 512;
-    clip->GetClipParams()->fieldLayout = 3;
-    EXPECT_EQ(clip->SetFieldLayoutDetails(), NCF_OK);
-    ExpectFields(256, 256);
+    for (const auto& choice : kChoices) {
+        clip->GetClipParams()->fieldOrderInFile = choice.order;
+        clip->GetClipParams()->fieldLayout = choice.layout;
+        host->console().clear();
+        EXPECT_EQ(clip->SetFieldLayoutDetails(), NCF_OK);
+        ExpectFields(choice.expectedOrder, choice.expectedLayout);
+        EXPECT_EQ(clip->GetClipParams()->detectedFieldOrder, 256u) << "the file says the same";
+        EXPECT_EQ(
+            Console(4, "QueryVideoDescBufferDetails says we are full progressive and merged \n"),
+            1);
+    }
 }
 
 TEST_F(QuickTimeClipPicture, EndsTheLoadWhenFieldsCannotBeRead) {
