@@ -169,13 +169,10 @@ NCFRESULT QuickTimeWrapper::GetMovieBox(ncfUInt32* width, ncfUInt32* height, ncf
     return NCF_OK;
 }
 
-// Frames come out at their stored size always; a box of no size is a mistake.
-NCFRESULT QuickTimeWrapper::QTWSetMovieBox(ncfSInt16 top, ncfSInt16 left, ncfSInt16 bottom,
-                                           ncfSInt16 right) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    return bottom == top || right == left ? NCF_E_INVALIDARG : NCF_OK;
+// Frames come out at their stored size always, whatever the box. Its 16 bits hold
+// 0 for a side of 65536.
+NCFRESULT QuickTimeWrapper::QTWSetMovieBox(ncfSInt16, ncfSInt16, ncfSInt16, ncfSInt16) {
+    return movie_ ? NCF_OK : NMA_E_NOTINITIALIZED;
 }
 
 }  // namespace host
