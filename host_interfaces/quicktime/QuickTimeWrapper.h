@@ -33,7 +33,9 @@ struct IQuickTimeWrapper : INCFUnknown {
                                                ncfUInt64 length, ncfBool* sound,
                                                ncfBool* picture) = 0;
     virtual ncfBool MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) = 0;  // 13
-    virtual ncfBool GetFirstVideoTrack(ncfUInt32* track) = 0;               // 14
+    // 14. The one whose pictures the video reader delivers: the first of the file,
+    // or of the lowest number where the movie's header can't be read.
+    virtual ncfBool GetFirstVideoTrack(ncfUInt32* track) = 0;
     // 15. Fields in a frame, 1 or 2; false: unknown.
     virtual ncfBool GetFieldLayoutForTrack(ncfUInt32 track, ncfUInt32* fieldCount) = 0;
     // 16. Code of the sample description of any kind of track, four bytes in
@@ -76,8 +78,9 @@ struct IQuickTimeWrapper : INCFUnknown {
                                                       ncfUInt64* trackLengths,
                                                       ncfUInt32 trackLengthCount,
                                                       ncfBool useMovieHeader) = 0;
+    // 32. Any box will do: pictures come at their stored size.
     virtual NCFRESULT QTWSetMovieBox(ncfSInt16 top, ncfSInt16 left, ncfSInt16 bottom,
-                                     ncfSInt16 right) = 0;                // 32
+                                     ncfSInt16 right) = 0;
     virtual NCFRESULT GetVendor(ncfUInt32 track, ncfUInt32* vendor) = 0;  // 33. 0: none
     virtual ncfUInt64 GetTrackDuration(ncfUInt32 track) = 0;              // 34. movie time units
     virtual ncfUInt32 GetMovieTimeScale() = 0;                            // 35. units per second

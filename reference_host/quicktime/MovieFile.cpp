@@ -9,9 +9,12 @@ extern "C" {
 }
 
 #include <algorithm>
+#include <fstream>
+#include <iterator>
 #include <limits>
 #include <set>
 
+#include "reference_host/header_parser/QTParser.h"
 #include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/PacketList.h"
 
@@ -62,6 +65,23 @@ double SecondsOf(const std::vector<PacketEntry>& packets, const AVStream& stream
     return span > 0.0 ? span * av_q2d(stream.time_base) : 0.0;
 }
 
+// 0 for none.
+ncfUInt32 Lowest(const std::vector<ncfUInt32>& tracks) {
+    return tracks.empty() ? 0 : *std::min_element(tracks.begin(), tracks.end());
+}
+
+// Whether the header parser takes the movie.
+bool HeaderIsRead(const std::filesystem::path& path) {
+    std::ifstream stream(path, std::ios::binary);
+    const auto readAt = [&stream](ncfUInt64 position, ncfUInt8* to, ncfUInt32 wanted) {
+        stream.clear();
+        stream.seekg(static_cast<std::streamoff>(position));
+        stream.read(reinterpret_cast<char*>(to), wanted);
+        return static_cast<ncfUInt32>(stream.gcount());
+    };
+    return header_parser::ReadHeaders(*MakeRef<header_parser::QTParser>(), readAt) >= 0;
+}
+
 }  // namespace
 
 std::unique_ptr<MovieFile> MovieFile::Open(const std::filesystem::path& path, std::string& reason) {
@@ -75,6 +95,9 @@ MovieFile::MovieFile(std::filesystem::path path, InputOwner input)
         atoms_ = ReadMovieAtoms(path_);
     }
     NumberTracks();
+    const std::vector<ncfUInt32> pictures = TracksWhere(&MovieFile::IsVideo);
+    countsAsInFile_ =
+        !std::is_sorted(pictures.begin(), pictures.end()) && IndexIsWhole() && HeaderIsRead(path_);
     const bool isByContainer = !HasStreamDetails(*input_);
     for (unsigned i = 0; i < input_->nb_streams; ++i) {
         const AVStream& stream = *input_->streams[i];
@@ -170,22 +193,20 @@ bool MovieFile::IsTimecode(ncfUInt32 track) const {
            stream->codecpar->codec_tag == kTimecodeTag;
 }
 
-ncfUInt32 MovieFile::FirstWhere(bool (MovieFile::*test)(ncfUInt32) const) const {
-    ncfUInt32 first = 0;
-    for (const ncfUInt32 number : numbers_) {
-        if ((this->*test)(number) && (first == 0 || number < first)) {
-            first = number;
-        }
-    }
-    return first;
+std::vector<ncfUInt32> MovieFile::TracksWhere(bool (MovieFile::*test)(ncfUInt32) const) const {
+    std::vector<ncfUInt32> tracks;
+    std::copy_if(numbers_.begin(), numbers_.end(), std::back_inserter(tracks),
+                 [this, test](ncfUInt32 number) { return (this->*test)(number); });
+    return tracks;
 }
 
 ncfUInt32 MovieFile::FirstVideo() const {
-    return FirstWhere(&MovieFile::IsVideo);
+    const std::vector<ncfUInt32> tracks = TracksWhere(&MovieFile::IsVideo);
+    return countsAsInFile_ ? tracks.front() : Lowest(tracks);
 }
 
 ncfUInt32 MovieFile::FirstAudio() const {
-    return FirstWhere(&MovieFile::IsAudio);
+    return Lowest(TracksWhere(&MovieFile::IsAudio));
 }
 
 std::map<ncfUInt32, int> MovieFile::StreamsByTrack() const {

@@ -4,6 +4,7 @@
 
 #include <filesystem>
 #include <map>
+#include <memory>
 #include <optional>
 #include <string>
 #include <vector>
@@ -41,8 +42,11 @@ public:
     bool IsVideo(ncfUInt32 track) const;  // pictures attached to sound are none
     bool IsAudio(ncfUInt32 track) const;
     bool IsTimecode(ncfUInt32 track) const;
-    ncfUInt32 FirstVideo() const;  // 0 for none
-    ncfUInt32 FirstAudio() const;
+    // The picture track that is described and delivered, 0 for none. Readers of
+    // the movie's header count tracks as they stand in the file; who has nothing
+    // but the wrapper walks their numbers from the lowest.
+    ncfUInt32 FirstVideo() const;
+    ncfUInt32 FirstAudio() const;                     // of the lowest number
     std::map<ncfUInt32, int> StreamsByTrack() const;  // ids included
 
     // What the headers left open is read from the media before this answers.
@@ -77,12 +81,13 @@ private:
     double MeanRateOfMedia(int stream) const;
     double MeanRateOfPackets(int stream);
     double SecondsOfPackets(int stream);
-    ncfUInt32 FirstWhere(bool (MovieFile::*test)(ncfUInt32) const) const;
+    std::vector<ncfUInt32> TracksWhere(bool (MovieFile::*test)(ncfUInt32) const) const;
 
     std::filesystem::path path_;
     InputOwner input_;
     MovieAtoms atoms_;
     std::vector<ncfUInt32> numbers_;  // of the stream at the same place
+    bool countsAsInFile_ = false;     // picture tracks, not by their numbers
     struct Told {
         AVFieldOrder fieldOrder;
         AVRational rate;

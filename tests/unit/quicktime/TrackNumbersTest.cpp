@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+
 #include "reference_host/framework/String.h"
 #include "tests/support/movies/Movie.h"
 #include "tests/unit/quicktime/MadeMovie.h"
@@ -138,6 +140,75 @@ TEST(TrackNumbers, LeavePicturesAttachedToSoundAside) {
         EXPECT_EQ(wrapper->IsAudioTrack(1), 1) << ending;
         EXPECT_EQ(wrapper->GetNumberOfTracks(), 2u) << ending;
     }
+}
+
+// Two uncompressed pictures, the first red and 16 wide, the second blue and 8
+// wide, under these ids.
+movies::Movie TwoPictures(std::uint32_t first, std::uint32_t second) {
+    movies::Movie movie;
+    const struct {
+        std::uint32_t id;
+        unsigned width;
+        std::uint64_t frames;
+        std::array<std::uint8_t, 3> color;
+    } kTracks[] = {{first, 16, 6, {255, 0, 0}}, {second, 8, 3, {0, 0, 255}}};
+    for (const auto& each : kTracks) {
+        movies::VideoFormat format;
+        format.codec = "raw ";
+        format.width = each.width;
+        format.height = 8;
+        movies::Track track =
+            movies::VideoTrack(format, each.frames, 25, 1, each.width * format.height * 3);
+        track.id = each.id;
+        for (std::uint64_t i = 0; i < each.frames * each.width * format.height; ++i) {
+            track.data.insert(track.data.end(), each.color.begin(), each.color.end());
+        }
+        movie.tracks.push_back(track);
+    }
+    return movie;
+}
+
+TEST(FirstPictureTrack, IsTheFirstOfTheFileWhateverItsId) {
+    for (const auto& [first, second] :
+         {std::pair(1u, 2u), std::pair(5u, 2u), std::pair(65536u, 2u), std::pair(7u, 65536u)}) {
+        SCOPED_TRACE(std::to_string(first) + " before " + std::to_string(second));
+        const MadeMovie movie(movies::Build(TwoPictures(first, second)).ToBytes(), ".mov");
+        const Wrapper wrapper = OpenWrapper(movie.Path());
+        ASSERT_TRUE(wrapper);
+        ncfUInt32 track = 0, width = 0, height = 0;
+        ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1);
+        EXPECT_EQ(track, first == 65536u ? 1u : first == 7u ? 1u : first);
+        ASSERT_EQ(wrapper->GetMovieBox(&width, &height, nullptr, nullptr), NCF_OK);
+        EXPECT_EQ(width, 16u);
+        const auto reader = OpenVideo(movie.Path(), Code("BGRA"));
+        ASSERT_TRUE(reader);
+        ncfUInt64 count = 0;
+        const Bytes pictures = AllPictures(*reader, &count);
+        EXPECT_EQ(count, 6u);
+        ASSERT_EQ(pictures.size(), 6u * 16u * 8u * 4u);
+        EXPECT_EQ(Bytes(pictures.begin(), pictures.begin() + 4), (Bytes{0, 0, 255, 255}));
+    }
+}
+
+// Of a movie whose header only the wrapper reads, callers walk the numbers: the
+// lowest is the first that they find.
+TEST(FirstPictureTrack, IsThatOfTheLowestNumberWhereTheHeaderIsRefused) {
+    movies::Movie movie = TwoPictures(5, 2);
+    movie.headerVersion = 1;
+    movie.duration = std::uint64_t{1} << 33;
+    const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+    const Wrapper wrapper = OpenWrapper(file.Path());
+    ASSERT_TRUE(wrapper);
+    ncfUInt32 track = 0, width = 0, height = 0;
+    ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1);
+    EXPECT_EQ(track, 2u);
+    ASSERT_EQ(wrapper->GetMovieBox(&width, &height, nullptr, nullptr), NCF_OK);
+    EXPECT_EQ(width, 8u);
+    const auto reader = OpenVideo(file.Path(), Code("BGRA"));
+    ASSERT_TRUE(reader);
+    ncfUInt64 count = 0;
+    AllPictures(*reader, &count);
+    EXPECT_EQ(count, 3u);
 }
 
 TEST(TrackDescriptions, TellVendorsOfAnyBytes) {
