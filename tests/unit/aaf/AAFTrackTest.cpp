@@ -62,6 +62,24 @@ TEST_F(AAFTrackTest, AStartTimeMovesTheReferencesApartAndLengthensTheFileMob) {
     EXPECT_TRUE(aaf.has("File1.NewPhysSourceRef 25/1 1 DataDef1 {A1 slot 1 at -10} 110"));
 }
 
+// The number where the names begin has no part in the ids.
+TEST_F(AAFTrackTest, TakesIdsFromTheSlotsThereAreNotFromTheStartOfTheNames) {
+    ASSERT_EQ(AddAAFTrack(kAAFDataDef_LegacySound, L"A%d", 2, 40, 7, {25, 1}, 100, Dictionary(),
+                          masterMob, As<IAAFMasterMob>(masterMob), fileMob,
+                          As<IAAFSourceMob>(fileMob), sourceMob, As<IAAFSourceMob>(sourceMob), 0),
+              NCF_OK);
+    EXPECT_TRUE(aaf.has("Master1.NewPhysSourceRef 25/1 8 DataDef1 {B1 slot 8 at 0} 100"));
+    EXPECT_TRUE(aaf.has("File1.NewPhysSourceRef 25/1 9 DataDef1 {A1 slot 9 at 0} 100"));
+    EXPECT_TRUE(aaf.has("Source1.AddNilReference 9 12960000 DataDef1 25/1"));
+}
+
+TEST_F(AAFTrackTest, StartsGoBeyond32Bits) {
+    ASSERT_EQ(Add(1, 0, 6000000000), NCF_OK);
+    EXPECT_TRUE(aaf.has("Master1.NewPhysSourceRef 25/1 1 DataDef1 {B1 slot 1 at 6000000000} 100"));
+    EXPECT_TRUE(
+        aaf.has("File1.NewPhysSourceRef 25/1 1 DataDef1 {A1 slot 1 at -6000000000} 6000000100"));
+}
+
 TEST_F(AAFTrackTest, EveryRefusalComesBackUnchanged) {
     for (const char* call : {"File1.GetMobID", "Source1.GetMobID", "Dictionary.LookupDataDef",
                              "Master1.NewPhysSourceRef", "Master1.LookupSlot", "Master1Slot",

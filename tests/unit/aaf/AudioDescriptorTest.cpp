@@ -123,6 +123,23 @@ TEST_F(AudioDescriptorTest, TheAverageIsRounded) {
     EXPECT_TRUE(aaf.has("PCMDescriptor2.SetAudioSamplingRate 8000/1"));
 }
 
+// 8 * 0x20000001 * 1.5 is 0x18000000C. Whole numbers of 32 bits would lose the
+// top before the rate comes in.
+TEST_F(AudioDescriptorTest, TheAverageIsWorkedOutInDoubles) {
+    Track().metadata.bytesPerPacket = 0x20000001;
+    Track().metadata.sampleRate = 1.5;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("PCMDescriptor1.SetAverageBPS " + std::to_string(0x8000000Cu)));
+}
+
+TEST_F(AudioDescriptorTest, AnyFlagButZeroIsSet) {
+    Track().metadata.isConstantBitRate = 2;
+    Track().metadata.isBigEndian = 2;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_TRUE(aaf.has("PCMDescriptor1.SetAverageBPS 1536000"));
+    EXPECT_TRUE(aaf.has("PCMDescriptor1.SetCompression 0F020202-0301-0100-060E-2B3404010101"));
+}
+
 TEST_F(AudioDescriptorTest, NumbersTooLargeKeepTheirLowBits) {
     Track().metadata.bytesPerPacket = 0x10001;
     Track().metadata.channelsPerFrame = 0x20003;

@@ -188,6 +188,17 @@ TEST_F(BinColumnsTest, TheMappingTiesParametersToColumns) {
                   "322655d50a5646ca9260d006f719b8a4:GFX-Video Level:'"}));
 }
 
+TEST_F(BinColumnsTest, AnyAnswerButZeroRefusesTheMapping) {
+    for (int nth = 1; nth <= 3; ++nth) {
+        aaf.clearJournal();
+        aaf.refuse("MasterMob1.AppendComment", 1, nth);
+        EXPECT_EQ(AddBinColMappingToMob(mob), NMA_E_AAF_ADD);
+        EXPECT_EQ(aaf.journal().lines().size(), static_cast<std::size_t>(nth));
+    }
+    EXPECT_TRUE(lines.contains(
+        "Unable to add bin column mapping comment, AAFResult = 0x1, QuickTimeToAAF("));
+}
+
 TEST_F(BinColumnsTest, ARefusedMappingEndsAtOnceWithItsOwnCode) {
     for (int nth = 1; nth <= 3; ++nth) {
         aaf.clearJournal();

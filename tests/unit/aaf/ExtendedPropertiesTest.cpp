@@ -151,6 +151,21 @@ TEST_F(ExtendedPropertiesTest, SliceCountIsAnIntegerOfThePicture) {
     EXPECT_TRUE(aaf.has("TypeDef1.CreateValue [8]"));
 }
 
+TEST_F(ExtendedPropertiesTest, APropertyFoundWithSomethingToTellIsNotRegisteredAgain) {
+    ASSERT_EQ(SetCount(10), NCF_OK);
+    ASSERT_EQ(Put(), NCF_OK);
+    aaf.clearJournal();
+    aaf.refuse("ClassDefCDCIDescriptor1.LookupPropertyDef", 1);
+    EXPECT_EQ(SetCount(8), NCF_OK);
+    EXPECT_TRUE(aaf.has("Intra1.SetPropertyValue PropertyAVCISliceCount1 Value6"));
+    aaf.refuse(kClass + "LookupPropertyDef", 1);
+    EXPECT_EQ(Put(), NCF_OK);
+    EXPECT_TRUE(aaf.hasRefused());
+    for (const std::string& line : aaf.journal().lines()) {
+        EXPECT_EQ(line.find("RegisterOptionalPropertyDef"), std::string::npos) << line;
+    }
+}
+
 TEST_F(ExtendedPropertiesTest, SliceCountLogsTheStatementThatFailed) {
     const std::pair<const char*, const char*> statements[] = {
         {"Dictionary.LookupTypeDef", "pDictionary->LookupTypeDef(kAAFTypeID_Int32, &pTDint32)"},

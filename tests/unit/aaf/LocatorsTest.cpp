@@ -70,6 +70,13 @@ TEST_F(StartTimeTest, IsAddedToEverySourceClip) {
     EXPECT_TRUE(aaf.has("SourceMob1Clip2.SetSourceReference {00 slot 5 at 1005}"));
 }
 
+TEST_F(StartTimeTest, GoesBeyond32Bits) {
+    ASSERT_EQ(AddStartTimeToSourceClip(mob, 6000000000), NCF_OK);
+    ASSERT_EQ(AddStartTimeToSourceClip(mob, 6000000000), NCF_OK);
+    EXPECT_TRUE(aaf.has("SourceMob1Clip1.SetSourceReference {00 slot 4 at 6000000004}"));
+    EXPECT_TRUE(aaf.has("SourceMob1Clip2.SetSourceReference {00 slot 5 at 12000000005}"));
+}
+
 TEST_F(StartTimeTest, TheLoopEndsAtAnyOtherAnswerOfTheEnumerator) {
     int enumerator = 0;
     for (const HRESULT answer : {AAFRESULT_INTERNAL_ERROR, HRESULT{1}}) {

@@ -72,6 +72,13 @@ TEST_F(TimecodeTest, FillersOfNoLengthAreMadeLikeAnyOther) {
     EXPECT_TRUE(aaf.has("SourceMob1Slot1.SetPhysicalNum 4"));
 }
 
+TEST_F(TimecodeTest, LengthsAndStartsGoBeyond32Bits) {
+    ASSERT_EQ(Add(1, 5000000000, 20000000000, 6000000000), NCF_OK);
+    EXPECT_TRUE(aaf.has("Filler1.Initialize DataDef1 6000000000"));
+    EXPECT_TRUE(aaf.has("Timecode1.SetLength 5000000000"));
+    EXPECT_TRUE(aaf.has("Filler2.Initialize DataDef1 9000000000"));
+}
+
 TEST_F(TimecodeTest, AFillerThatWouldBeNegativeIsTheLibrarysToRefuse) {
     EXPECT_EQ(Add(1, 2592000, 0), NCF_E_FAIL);
     EXPECT_TRUE(aaf.has("Filler2.Initialize DataDef1 -2592000"));

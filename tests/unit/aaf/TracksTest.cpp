@@ -98,6 +98,36 @@ TEST_F(TracksTest, ChecksItsArgumentsInOrder) {
     }
 }
 
+// Of several that are missing the first one is told.
+TEST_F(TracksTest, TellsTheFirstMissingArgumentAlone) {
+    const std::tr1::shared_ptr<BaseClip> none;
+    const auto master = As<IAAFMasterMob>(masterMob);
+    const auto file = As<IAAFSourceMob>(fileMob);
+    const auto source = As<IAAFSourceMob>(sourceMob);
+    const char* const names[] = {"media.get()",      "pConsole",          "pDictionary",
+                                 "pMobMasterMob",    "pMasterMob",        "pMobFileMob",
+                                 "pFileMob",         "pMobSourceMob",     "pSourceMob",
+                                 "pMultiDescriptor", "pComponentFactory", "absoluteStartTime"};
+    for (int present = 0; present < 12; ++present) {
+        log.clear();
+        EXPECT_EQ(AddTracksToAAF(present > 0 ? Media() : none,
+                                 present > 1 ? Console() : NCFSmartPtr<INCFConsole>(), nullptr,
+                                 present > 2 ? (IAAFDictionary*)Dictionary() : nullptr,
+                                 present > 3 ? (IAAFMob*)masterMob : nullptr,
+                                 present > 4 ? (IAAFMasterMob*)master : nullptr,
+                                 present > 5 ? (IAAFMob*)fileMob : nullptr,
+                                 present > 6 ? (IAAFSourceMob*)file : nullptr,
+                                 present > 7 ? (IAAFMob*)sourceMob : nullptr,
+                                 present > 8 ? (IAAFSourceMob*)source : nullptr,
+                                 present > 9 ? (IAAFMultipleDescriptor*)multi : nullptr,
+                                 present > 10 ? host.factory() : nullptr, nullptr),
+                  NCF_E_POINTER);
+        ASSERT_EQ(log.records().size(), 1u) << names[present];
+        EXPECT_EQ(log.records()[0].text,
+                  std::string("CHK_PTR(") + names[present] + ")" + kFunction);
+    }
+}
+
 TEST_F(TracksTest, AVideoClipWithTimecodeAndTwoStereoTracks) {
     clip->timecode.resize(1);
     clip->sound.resize(2);
@@ -284,6 +314,24 @@ TEST_F(TracksTest, TimecodeWithoutARateIsRefused) {
                   "tcFPS, *((bool*)&tcInfo.drop), &tcInFrames)",
                   kFunction)),
               1);
+}
+
+TEST_F(TracksTest, AScaledStartGoesBeyond32Bits) {
+    clip->rate = {1000000, 1};
+    clip->setTiming();
+    clip->timecode.resize(1);
+    clip->timecode[0].metadata = {2, 0, 0, 0, 1, 1, 0, 1};  // 7200 seconds, 1 frame each
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(start, 7200000000);
+}
+
+TEST_F(TracksTest, ATimecodeWithSomethingToTellIsStillComplete) {
+    clip->timecode.resize(1);
+    clip->timecode[0].result = 1;
+    ASSERT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(start, 90000);
+    EXPECT_EQ(host.console().count(2, "TimeCode track metadata incomplete.\n"), 0);
+    EXPECT_EQ(aaf.linesOf("Source1.AppendNewTimelineSlot").size(), 1u);
 }
 
 TEST_F(TracksTest, OfSeveralTimecodeTracksTheLastStartWins) {

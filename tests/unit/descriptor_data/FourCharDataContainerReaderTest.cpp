@@ -69,6 +69,23 @@ TEST_F(FourCharReaderTest, AMatchingVendorWins) {
     EXPECT_EQ(id_, 2u);
 }
 
+TEST_F(FourCharReaderTest, TheFirstOfSeveralEqualVendorsWins) {
+    Load(Mapping("FourChar='apch' Vendor='abcd' vcid='1'") +
+         Mapping("FourChar='apch' Vendor='efgh' vcid='2'") +
+         Mapping("FourChar='apch' Vendor='efghi' vcid='3'") +
+         Mapping("FourChar='apch' Vendor='efgh' vcid='4'"));
+    EXPECT_EQ(Look("apch", "efgh", 1920, 1080), NCF_OK);
+    EXPECT_EQ(id_, 2u);
+}
+
+TEST_F(FourCharReaderTest, IdsAreDecimalAlsoWithLeadingZeros) {
+    Load(Mapping("FourChar='v210' vcid='0010'") + Mapping("FourChar='2vuy' vcid='0x10'"));
+    EXPECT_EQ(Look("v210", "", 0, 0), NCF_OK);
+    EXPECT_EQ(id_, 10u);
+    EXPECT_EQ(Look("2vuy", "", 0, 0), NCF_OK);
+    EXPECT_EQ(id_, 0u);
+}
+
 TEST_F(FourCharReaderTest, ASingleEntryAnswersWhateverItsVendorAndTheTableSay) {
     Load(Mapping("FourChar='apch' Vendor='abcd' vcid='9'"));
     EXPECT_EQ(Look("apch", "zzzz", 1920, 1080), NCF_OK);

@@ -164,6 +164,23 @@ TEST_F(RetrieverTest, FieldsHalveTheHeight) {
     EXPECT_EQ(id_, 3710u);
 }
 
+TEST_F(RetrieverTest, TheTableIsAskedWithTheClipsRate) {
+    EXPECT_EQ(Init(Entry("1", "CDCI", Join(CDCIValues())),
+                   "<FourCharMapping FourChar='NVj2'/><FourCharMapping FourChar='NVj2'/>"),
+              NCF_OK);
+    clip_.code = Code("NVj2");
+    clip_.width = 1920;
+    clip_.height = 1080;
+    clip_.layout = 0;
+    const std::pair<Rational, ncfUInt32> kIds[] = {
+        {{24000, 1001}, 551}, {{30000, 1001}, 558}, {{25, 1}, 559}, {{24, 1}, 560}};
+    for (const auto& [rate, id] : kIds) {
+        clip_.rate = rate;
+        EXPECT_EQ(GetInfo(), NCF_E_NOTSUPPORTED) << "no record of it here";
+        EXPECT_EQ(id_, id) << rate.numerator;
+    }
+}
+
 TEST_F(RetrieverTest, AClipThatDoesNotTellItsLayoutIsAFullFrame) {
     const std::string two = Entry("1", "CDCI", Join(CDCIValues()));
     EXPECT_EQ(

@@ -178,6 +178,60 @@ TEST_F(SilentEntry, AnMPEG2EntryMustHaveItsThreeValues) {
     Expect("MPEG2Video", MPEG2Values(), "MaxGOP", false, "GetMaxGOPFromVCID");
 }
 
+// Of several values that are missing the first in this order is told.
+TEST_F(SilentEntry, MandatoryGettersRunInTheirOrder) {
+    const std::pair<const char*, const char*> kOrder[] = {
+        {"EssenceContainerLabel", "GetEssenceContainerLabelFromVCID"},
+        {"FrameLayout", "GetFrameLayoutFromVCID"},
+        {"StoredWidth", "GetStoredWidthFromVCID"},
+        {"StoredHeight", "GetStoredHeightFromVCID"},
+        {"AspectRatio", "GetAspectRatioFromVCID"},
+        {"PictureEssenceCoding", "GetPictureEssenceCodingFromVCID"},
+        {"ComponentDepth", "GetComponentDepthFromVCID"},
+        {"VideoLineMap", "GetVideoLineMapFromVCID"},
+        {"HorizontalSubsampling", "GetHorizontalSubsamplingFromVCID"},
+        {"VerticalSubsampling", "GetVerticalSubsamplingFromVCID"},
+        {"ColorSiting", "GetColorSitingFromVCID"},
+        {"BlackRefLevel", "GetBlackRefLevelFromVCID"},
+        {"WhiteReflevel", "GetWhiteRefLevelFromVCID"},
+        {"ColorRange", "GetColorRangeFromVCID"},
+        {"BitRate", "GetBitRateFromVCID"},
+        {"ProfileAndLevel", "GetProfileAndLevelFromVCID"},
+        {"MaxGOP", "GetMaxGOPFromVCID"},
+    };
+    const Values whole = MPEG2Values();
+    Values values;
+    values["SampledWidth"] = whole.at("SampledWidth");  // by these two it is found
+    values["DisplayHeight"] = whole.at("DisplayHeight");
+    clip_.width = 718;
+    for (const auto& [element, getter] : kOrder) {
+        ShutDownInfoRetriever();
+        log.clear();
+        EXPECT_LT(InitAndGetInfo("MPEG2Video", values), 0) << getter;
+        EXPECT_TRUE(log.contains(std::string(" on call to: ") + getter)) << getter;
+        values[element] = whole.at(element);
+    }
+    ShutDownInfoRetriever();
+    EXPECT_EQ(InitAndGetInfo("MPEG2Video", values), NCF_OK);
+}
+
+TEST_F(SilentEntry, ARecordThatIsThrownAwayIsCheckedAllTheSame) {
+    Values values = MPEG2Values();
+    values.erase("MaxGOP");
+    EXPECT_EQ(Init(Entry("1", "MPEG2Video", Join(values))), NCF_OK);
+    EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
+                  &clip_, nullptr, &id_),
+              NCF_E_PARAMETERNOTAVAILABLE);
+    EXPECT_EQ(id_, 1u);
+    EXPECT_TRUE(IsMPEG()) << "read up to the last value";
+    EXPECT_TRUE(log.contains("on call to: GetMaxGOPFromVCID"));
+    clip_.layout = 0;
+    clip_.layoutResult = NCF_E_NOTFOUND;
+    EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
+                  &clip_, nullptr, &id_),
+              NCF_E_NOTFOUND);
+}
+
 TEST_F(SilentEntry, WidthsAndHeightsFallBackToTheStoredOnes) {
     Values values = CDCIValues();
     values.erase("SampledWidth");

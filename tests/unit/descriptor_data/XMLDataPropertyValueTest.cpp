@@ -158,6 +158,26 @@ TEST_F(PropertySearch, ANameThatOccursTwiceIsTheNearestOne) {
     EXPECT_EQ(found_, &twinOfA_);
 }
 
+TEST_F(PropertySearch, ANodeComesBeforeAChildOfItsName) {
+    XMLDataPropertyValue inner(&bName_);
+    b_.AddChild(&inner);
+    EXPECT_EQ(b_.FindNextProperty("b", &found_), NCF_OK);
+    EXPECT_EQ(found_, &b_);
+    EXPECT_EQ(leaf_.FindNextProperty("b", &found_), NCF_OK);
+    EXPECT_EQ(found_, &b_);
+}
+
+TEST_F(PropertySearch, AParentComesBeforeItsSiblingsOfTheSameName) {
+    XMLDataPropertyValue secondB(&bName_);
+    XMLDataPropertyValue secondLeaf(&leafName_);
+    root_.AddChild(&secondB);
+    secondB.AddChild(&secondLeaf);
+    EXPECT_EQ(secondLeaf.FindNextProperty("b", &found_), NCF_OK);
+    EXPECT_EQ(found_, &secondB);
+    EXPECT_EQ(a_.FindNextProperty("b", &found_), NCF_OK);
+    EXPECT_EQ(found_, &b_) << "of several children the first";
+}
+
 TEST_F(PropertySearch, NeverLooksIntoChildrenOfASibling) {
     EXPECT_EQ(a_.FindNextProperty("leaf", &found_), 1);
     EXPECT_EQ(root_.FindNextProperty("twin", &found_), 1);

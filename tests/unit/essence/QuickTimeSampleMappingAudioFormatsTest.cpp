@@ -105,6 +105,14 @@ TEST_F(AudioFormats, ChoiceTellsTheReaderAndKeepsItsChannelCount) {
         << "big-endian, and one channel is offered again";
 }
 
+TEST_F(AudioFormats, ChoosesUnderTheLock) {
+    std::vector<ncfUInt32> chosen;
+    lock->whenLocked = [&] { chosen.push_back(mapping->_mediaTracks[1]->GetSelectedIndex()); };
+    EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 1), NCF_OK);
+    EXPECT_EQ(chosen, std::vector<ncfUInt32>{0}) << "nothing is chosen before the lock";
+    EXPECT_EQ(mapping->_mediaTracks[1]->GetSelectedIndex(), 1u);
+}
+
 TEST_F(AudioFormats, ReportsAChannelCountThatDiffersFromTheFiles) {
     wrapper->sound->channels = 6;
     clip->metadata.channelsPerFrame = 2;

@@ -527,4 +527,40 @@ TEST_F(Delivery, MappingsOfOneClipShareItsReaders) {
     lock = ours;
 }
 
+// The reader is the clip's, but a mapping stops it only once it uses it.
+TEST_F(Delivery, CleanupOfAMappingWithoutAChoiceLeavesTheOthersReaderAlone) {
+    Movie({kBGRAPixelFormat, kb64aPixelFormat});
+    Choose(0, 0);
+    FakeLock* const ours = lock;
+    void* made = nullptr;
+    ASSERT_EQ(
+        CreateInstanceOf<OpenMapping>(host->unknown(), nullptr, NMA::IID_ISampleMapping, &made),
+        NCF_OK);
+    auto* const other = dynamic_cast<OpenMapping*>(static_cast<NMA::ISampleMapping*>(made));
+    NCFSmartPtr<INCFString> path;
+    path.attach(MakeHostString("/movies/a.mov"));
+    other->SetFilePath(path);
+    ASSERT_EQ(other->SetMediaContainer(clip), NCF_OK);
+    void* images = nullptr;
+    ASSERT_EQ(other->QueryInterface(NMA::IID_IUncompressedImageProvider, &images), NCF_OK);
+    static_cast<INCFUnknown*>(images)->Release();
+    journal.clear();
+    EXPECT_EQ(other->Setup(0), NCF_OK);
+    EXPECT_EQ(other->Cleanup(0), NCF_OK);
+    EXPECT_TRUE(journal.startingWith("reader.").empty());
+
+    ASSERT_EQ(other->SetWorkingImageFormat(0, 1), NCF_OK);
+    journal.clear();
+    EXPECT_EQ(other->Cleanup(0), NCF_OK);
+    EXPECT_EQ(journal.lines(), Lines{"reader.ReleaseQT"});
+    EXPECT_EQ(other->Cleanup(0), NCF_OK);
+    EXPECT_EQ(journal.count("reader.ReleaseQT"), 2) << "each one goes to the reader";
+    Frame().assign(8, 0);
+    journal.clear();
+    EXPECT_EQ(Ask(0), NCF_OK) << "the first one's choice stands";
+    EXPECT_EQ(journal.startingWith("reader.Set").back(), "reader.SetOutputPixelFormat BGRA 0 0");
+    static_cast<NMA::ISampleMapping*>(made)->Release();
+    lock = ours;
+}
+
 }  // namespace

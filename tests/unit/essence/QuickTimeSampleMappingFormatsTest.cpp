@@ -66,6 +66,17 @@ TEST_F(SampleMappingFormats, ThreeCodesAskForBGRA) {
     EXPECT_EQ(Console(4, "Adding support for BGRA.\n"), 3);
 }
 
+TEST_F(SampleMappingFormats, EachOfTheThreeCodesTakesTheRangeOfTheCodec) {
+    for (const ncfUInt32 code : {kBGRAPixelFormat, kRGBAPixelFormat, k32ARGBPixelFormat}) {
+        mapping->_mediaTracks.clear();
+        clip->video.clear();
+        Movie();
+        EXPECT_EQ(Add(code, 2), NCF_OK) << "any flag but 0";
+        EXPECT_EQ(Add(code, 0), NCF_OK);
+        EXPECT_EQ(Offered(0), (Lines{"8/4/2/1/1 <- BGRA", "8/4/2/1/2 <- BGRA"})) << CodeText(code);
+    }
+}
+
 TEST_F(SampleMappingFormats, NVZ2IsAlwaysVideoRangeAndHasNoAlpha) {
     Movie(true);
     EXPECT_EQ(Add(kNVZ2PixelFormat, 0), NCF_OK);
@@ -117,6 +128,15 @@ TEST_F(SampleMappingFormats, EightBitYCbCrComesInTheClipsColourSpace) {
     EXPECT_TRUE(IsRatio(Format(0, 0).qt_params.decodedBytesPerPixel, 2));
     EXPECT_TRUE(IsRatio(Format(0, 0).qt_params.outputBytesPerPixel, 2));
     EXPECT_EQ(Format(0, 0).qt_params.convert, nullptr);
+}
+
+TEST_F(SampleMappingFormats, ClipWithoutColourKeepsItsColourSpace) {
+    Movie();
+    clip->setColorSpace(CS_MONO);
+    clip->setSize(720, 576);
+    EXPECT_EQ(Add(k2vuyPixelFormat), NCF_OK);
+    EXPECT_EQ(Add(kv210PixelFormat), NCF_OK);
+    EXPECT_EQ(Offered(0), (Lines{"2/1/1/1/1 <- 2vuy", "2/1/1/1024/1 <- 2vuy"}));
 }
 
 TEST_F(SampleMappingFormats, TenBitYCbCrIsAskedForAsEightBitWithFourBytesAPixel) {

@@ -125,6 +125,18 @@ TEST_F(ImageFormats, FirstChoiceBringsTheReaderUnderTheLock) {
     EXPECT_TRUE(mapping->_mediaTracks[0]->GetSelectedFormat());
 }
 
+TEST_F(ImageFormats, ChoosesUnderTheLock) {
+    Movie({kBGRAPixelFormat, kb64aPixelFormat});
+    std::vector<ncfUInt32> chosen;
+    lock->whenLocked = [&] {
+        const MediaTrack& track = *mapping->_mediaTracks[0];
+        chosen.push_back(track.GetSelectedFormat() ? 77 : track.GetSelectedIndex());
+    };
+    EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_OK);
+    EXPECT_EQ(chosen, std::vector<ncfUInt32>{0}) << "nothing is chosen before the lock";
+    EXPECT_EQ(mapping->_mediaTracks[0]->GetSelectedIndex(), 1u);
+}
+
 TEST_F(ImageFormats, SameChoiceAgainChangesAndTellsNothing) {
     Movie({kBGRAPixelFormat});
     ASSERT_EQ(mapping->SetWorkingImageFormat(0, 0), NCF_OK);

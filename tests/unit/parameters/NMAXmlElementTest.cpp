@@ -84,6 +84,18 @@ TEST_F(XmlElement, MatchesChildrenByAnyText) {
     EXPECT_EQ(found.size(), 1u);
 }
 
+TEST_F(XmlElement, MatchesAnyOfSeveralChildrenOfOneName) {
+    Element* const root = load("<a><b><id>1</id><id>2</id><id>3</id></b><b><id>4</id></b></a>");
+    Element* const first = root->FindChild(S("b"), 0);
+    for (const wchar_t* const id : {L"1", L"2", L"3"}) {
+        const NMAXmlPair pair[] = {{L"id", id}};
+        EXPECT_TRUE(first->MatchesChildren(pair, 1, 1));
+        EXPECT_EQ(root->CountChildrenWithChildren(S("b"), pair, 1), 1u);
+    }
+    const NMAXmlPair neither[] = {{L"id", L"4"}};
+    EXPECT_FALSE(first->MatchesChildren(neither, 1, 1));
+}
+
 // --- attributes -----------------------------------------------------------------
 
 TEST_F(XmlElement, ReadsAttributesAndThrowsNoDataForAbsentOnes) {
@@ -121,6 +133,22 @@ TEST_F(XmlElement, RemovesAnAttributeOnce) {
     const std::string saved = Saved(doc);
     EXPECT_EQ(saved.find("x="), std::string::npos);
     EXPECT_NE(saved.find("<b"), std::string::npos);
+}
+
+TEST_F(XmlElement, RemovesAllAttributesOfAName) {
+    Element* const root = load("<a x=\"1\" y=\"2\"/>");
+    root->AddChild(new NMA::XMLUtils::NMAXmlAttribute(S("x"), S("3")));
+    root->AddChild(new NMA::XMLUtils::NMAXmlAttribute(S("x"), S("4")));
+    root->RemoveAttribute(S("x"));
+    EXPECT_FALSE(root->HasAttribute(S("x")));
+    std::vector<NMAXmlNode*> attributes;
+    root->GetAttributes(attributes);
+    ASSERT_EQ(attributes.size(), 4u) << "marked, not taken out";
+    EXPECT_EQ(attributes[0]->GetState(), NMAXmlNode::kDeleted);
+    EXPECT_NE(attributes[1]->GetState(), NMAXmlNode::kDeleted);
+    EXPECT_EQ(attributes[2]->GetState(), NMAXmlNode::kDeleted);
+    EXPECT_EQ(attributes[3]->GetState(), NMAXmlNode::kDeleted);
+    EXPECT_NE(Saved(doc).find("<a y=\"2\""), std::string::npos);
 }
 
 TEST_F(XmlElement, SetsAnAttributeAgainAfterItWasRemoved) {

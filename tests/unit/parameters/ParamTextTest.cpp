@@ -57,6 +57,14 @@ TEST_F(ParamTexts, NumbersMayHaveSpaceBeforeAndAnythingBehind) {
     EXPECT_EQ(read<ncfUInt32>("-1"), 4294967295u) << "wraps";
 }
 
+TEST_F(ParamTexts, LeadingZerosMakeNoOctals) {
+    EXPECT_EQ(read<ncfSInt32>("-0010"), -10);
+    EXPECT_EQ(read<ncfUInt32>("0010"), 10u);
+    EXPECT_EQ(read<ncfSInt64>("-0010"), -10);
+    EXPECT_EQ(read<ncfUInt64>("0089"), 89u);
+    EXPECT_EQ(read<NMAParamRational>("0030/0010"), (NMAParamRational{30, 10}));
+}
+
 TEST_F(ParamTexts, NumbersTooLargeLoseTheirHighBits) {
     EXPECT_EQ(read<ncfSInt32>("4294967297"), 1);
     EXPECT_EQ(read<ncfUInt32>("4294967298"), 2u);

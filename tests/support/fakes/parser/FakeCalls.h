@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <functional>
 #include <map>
 #include <string>
 
@@ -14,17 +15,22 @@
 //
 //     parser->results["GetTimeScale"] = NCF_E_FAIL;
 //
-// `passes` lets so many calls of an operation by before its result is given.
+// `passes` lets so many calls of an operation by before its result is given;
+// `whenAsked`, when set, is called first and may throw.
 struct FakeCalls {
     std::string who;
     Journal* journal = nullptr;
     std::map<std::string, NCFRESULT> results;
     std::map<std::string, int> passes;
+    std::function<void()> whenAsked;
 
 protected:
     FakeCalls(std::string name, Journal* lines) : who(std::move(name)), journal(lines) {}
 
     NCFRESULT enter(const char* operation) {
+        if (whenAsked) {
+            whenAsked();
+        }
         if (journal) {
             journal->add(who + "." + operation);
         }

@@ -160,16 +160,16 @@ struct ClassDefFace final : FakeAAFFace<IAAFClassDef> {
         return refused ? refused : self_.create(className, iid, (void**)object);
     }
     HRESULT LookupPropertyDef(aafUID_constref id, IAAFPropertyDef** out) override {
-        const HRESULT refused = note("LookupPropertyDef", id);
-        if (refused) {
-            return refused;
+        const HRESULT answer = note("LookupPropertyDef", id);
+        if (answer < 0) {
+            return answer;
         }
         FakeAAFObject* const found = self_.definition(id);
         if (!found) {
             return AAFRESULT_NO_MORE_OBJECTS;
         }
         *out = static_cast<IAAFPropertyDef*>(found->face(IID_IAAFPropertyDef));
-        return AAFRESULT_SUCCESS;
+        return answer;  // a positive one is a success with something to tell
     }
     HRESULT RegisterOptionalPropertyDef(aafUID_constref id, aafCharacter_constptr name,
                                         IAAFTypeDef* type, IAAFPropertyDef** out) override {
