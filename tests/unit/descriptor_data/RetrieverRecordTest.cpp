@@ -65,6 +65,26 @@ TEST_F(RetrieverTest, ACompleteEntryFillsTheRecord) {
     EXPECT_FALSE(IsRGBA());
 }
 
+TEST_F(RetrieverTest, EveryKindOfEntryTellsTheCommonValues) {
+    const std::pair<const char*, Values> kKinds[] = {
+        {"CDCI", CDCIValues()}, {"MPEG2Video", MPEG2Values()}, {"RGBA", RGBAValues()}};
+    for (const auto& [kind, values] : kKinds) {
+        ShutDownInfoRetriever();
+        info_ = AAFInfo();
+        EXPECT_EQ(InitAndGetInfo(kind, values), NCF_OK) << kind;
+        EXPECT_EQ(info_.essenceContainerLabel, ncfGuid("0d010301-0202-0101-060e-2b3404010101"));
+        EXPECT_EQ(info_.pictureEssenceCoding, ncfGuid("04010202-0201-0100-060e-2b3404010101"));
+        const std::vector<ncfUInt32> told = {
+            info_.frameLayout,      info_.storedWidth,         info_.storedHeight,
+            info_.sampledWidth,     info_.displayWidth,        info_.displayHeight,
+            info_.displayYOffset,   info_.aspectNumerator,     info_.aspectDenominator,
+            info_.ImageStartOffset, info_.imageAlignmentOffset};
+        EXPECT_EQ(told, (std::vector<ncfUInt32>{1, 720, 256, 718, 716, 243, 13, 4, 3, 3, 4}))
+            << kind;
+        EXPECT_EQ(info_.videoLineMapVect, (std::vector<ncfSInt32>{7, 270})) << kind;
+    }
+}
+
 TEST_F(RetrieverTest, TheEntrysFrameLayoutOverridesTheClips) {
     Values values = CDCIValues();
     values["FrameLayout"] = "3";
