@@ -47,7 +47,7 @@ void Describe(benchmark::State& state) {
     for (auto _ : state) {
         const cliphost::Description description = cliphost::DescribeMovie(session, path);
         if (!description.file) {
-            state.SkipWithError(description.problem.c_str());
+            state.SkipWithError(LineOf(description.problem).c_str());
             break;
         }
     }

@@ -80,7 +80,7 @@ void DescribeFolder(benchmark::State& state) {
             const auto description =
                 cliphost::DescribeFromList(session, clips.list(), clip.index, clip.path);
             if (!description.file) {
-                state.SkipWithError(description.problem.c_str());
+                state.SkipWithError(LineOf(description.problem).c_str());
                 return;
             }
         }

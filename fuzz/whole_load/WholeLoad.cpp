@@ -18,7 +18,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const fuzz::TimeLimit limit;
     {
         const auto description = cliphost::DescribeMovie(session, file.Hold(data, size));
-        if (!description.file && description.problem.empty()) {
+        if (!description.file && !description.problem) {
             std::fputs("a movie was refused without a word\n", stderr);
             std::abort();
         }

@@ -28,16 +28,16 @@ void CheckPlace(const std::filesystem::path& path) {
     std::error_code ignored;
     const auto there = std::filesystem::status(path, ignored);
     if (std::filesystem::exists(there) && !std::filesystem::is_regular_file(there)) {
-        throw Failure(
-            kExitCaller,
-            fmt::format("{}: not saved: a {} is there; name another file", DisplayPath(path),
-                        std::filesystem::is_directory(there) ? "folder" : "device"));
+        throw Failure(kExitCaller, path,
+                      fmt::format("not saved: a {} is there",
+                                  std::filesystem::is_directory(there) ? "folder" : "device"),
+                      "name another file");
     }
     const std::filesystem::path folder = std::filesystem::absolute(path, ignored).parent_path();
     if (!std::filesystem::is_directory(folder, ignored)) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: not saved: there is no folder {}; make it first",
-                                  DisplayPath(path), DisplayPath(folder)));
+        throw Failure(kExitCaller, path,
+                      fmt::format("not saved: there is no folder {}", DisplayPath(folder)),
+                      "make it first");
     }
 }
 
@@ -46,25 +46,23 @@ void CheckPlace(const std::filesystem::path& path) {
 AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
     std::string reason;
     if (!library_.Open(file, reason)) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: the AAF library can't be loaded: {}; name another with "
-                                  "--aaf-library FILE",
-                                  DisplayPath(file), reason));
+        throw Failure(kExitCaller, file, "the AAF library can't be loaded: " + reason,
+                      "name another with --aaf-library FILE");
     }
     for (const char* const name :
          {"AAFFileOpenTransient", "AAFFileOpenExistingRead", "AAFFileOpenNewModifyEx"}) {
         if (!library_.Find(name)) {
-            throw Failure(kExitCaller, fmt::format("{}: is no AAF library: it lacks {}",
-                                                   DisplayPath(file), name));
+            throw Failure(kExitCaller, file, fmt::format("is no AAF library: it lacks {}", name),
+                          "name another with --aaf-library FILE");
         }
     }
     // The module asks the system for the library by its name alone.
     if (!library_.IsFoundAs(kAAFLibraryName)) {
         throw Failure(
-            kExitCaller,
-            fmt::format("{}: the module would not find this AAF library: it asks the system for "
-                        "{}; give the file that name and start again with LD_LIBRARY_PATH={}",
-                        DisplayPath(file), kAAFLibraryName,
+            kExitCaller, file,
+            fmt::format("the module would not find this AAF library: it asks the system for {}",
+                        kAAFLibraryName),
+            fmt::format("give the file that name and start again with LD_LIBRARY_PATH={}",
                         DisplayPath(std::filesystem::absolute(file).parent_path())));
     }
 }
@@ -93,8 +91,8 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
         if (result < 0) {
             const std::string reason = TextOfResult(result);
             throw Failure(
-                kExitCaller,
-                fmt::format("{}: not saved: {} failed: {}", DisplayPath(path), step,
+                kExitCaller, path,
+                fmt::format("not saved: {} failed: {}", step,
                             reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result))
                                            : reason));
         }
@@ -113,8 +111,7 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     check(copy->Close(), "closing");
     fresh.TakePlace(error);
     if (error) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: not saved: {}", DisplayPath(path), error.message()));
+        throw Failure(kExitCaller, path, "not saved: " + error.message());
     }
 }
 
@@ -123,8 +120,7 @@ AafRef<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
     AafRef<IAAFFile> file;
     const HRESULT result = openRead(Wide(DisplayPath(path)).c_str(), 0, file.Out());
     if (result < 0) {
-        throw Failure(kExitFile, fmt::format("{}: can't be read as AAF: {}", DisplayPath(path),
-                                             TextOfResult(result)));
+        throw Failure(kExitFile, path, "can't be read as AAF: " + TextOfResult(result));
     }
     return file;
 }

@@ -29,9 +29,9 @@ constexpr std::uint64_t kBlock = 65536;  // samples of each channel read at a ti
 
 std::uint64_t WantedCount(const AudioOptions& options, const SoundReader& sound) {
     if (options.start >= sound.Count()) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: there is no sample {} of sound; it has {}, from 0 on",
-                                  DisplayPath(options.movie), options.start, sound.Count()));
+        throw Failure(kExitCaller, options.movie,
+                      fmt::format("there is no sample {} of sound", options.start),
+                      fmt::format("it has {}, from 0 on", sound.Count()));
     }
     const std::uint64_t left = sound.Count() - options.start;
     if (options.count && *options.count > left) {
@@ -67,16 +67,15 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
         form.rate = options.rate;
     }
     if (form.rate == 0) {
-        throw Failure(
-            kExitCaller,
-            fmt::format("{}: its samples a second are not known, since the movie can't be "
-                        "described; give --rate, such as --rate 48000",
-                        DisplayPath(options.movie)));
+        throw Failure(kExitCaller, options.movie,
+                      "its samples a second are not known, since the movie can't be described",
+                      "give --rate, such as --rate 48000");
     }
     const std::vector<unsigned char> header = WavHeader(form, count);
     if (header.empty()) {
-        throw Failure(kExitFile, fmt::format("{}: {} channels at {} Hz are no form of a WAV file",
-                                             DisplayPath(options.movie), form.channels, form.rate));
+        throw Failure(kExitFile, options.movie,
+                      fmt::format("{} channels at {} Hz are no form of a WAV file", form.channels,
+                                  form.rate));
     }
     RefuseOutputOntoMovie(options.output, options.movie);
     std::uint64_t silent = 0;

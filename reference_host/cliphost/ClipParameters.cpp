@@ -68,9 +68,9 @@ const host::ParameterInfo& FindParameter(const std::vector<host::ParameterInfo>&
             return info;
         }
     }
-    throw Failure(kExitCaller,
-                  fmt::format("--set {}: the clip has no such parameter, but these:{}", name,
-                              Listed(infos, [](const auto& info) { return info.name; })));
+    throw Failure(kExitCaller, "--set " + name,
+                  "the clip has no such parameter, but these:" +
+                      Listed(infos, [](const auto& info) { return info.name; }));
 }
 
 ncfUInt32 FindValue(const host::ParameterInfo& info, const std::string& text) {
@@ -93,11 +93,10 @@ ncfUInt32 FindValue(const host::ParameterInfo& info, const std::string& text) {
     if (!text.empty() && end.ec == std::errc() && end.ptr == text.data() + text.size()) {
         return number;
     }
-    throw Failure(
-        kExitCaller,
-        fmt::format("--set {}={}: {}; write one of these, or a number:{}", info.name, text,
-                    found.empty() ? "there is no such choice" : "several choices begin so",
-                    Listed(info.choices, [](const auto& choice) { return choice.text; })));
+    throw Failure(kExitCaller, fmt::format("--set {}={}", info.name, text),
+                  found.empty() ? "there is no such choice" : "several choices begin so",
+                  "write one of these, or a number:" +
+                      Listed(info.choices, [](const auto& choice) { return choice.text; }));
 }
 
 bool HoldsValues(const host::ParameterDocument& document) {
@@ -124,7 +123,7 @@ ClipParameters::ClipParameters(Session& session, std::filesystem::path movie,
         result = host::Query(mapping.get(), parameters_);
     }
     if (result < 0) {
-        throw Failure(kExitFile, ProblemWith(session_, movie_, "no parameters", result));
+        throw Failure(kExitFile, ProblemWith(session_, movie_, result));
     }
 }
 
@@ -145,8 +144,8 @@ std::string ClipParameters::Xml(ParameterXml which) {
             break;
     }
     if (result < 0) {
-        throw Failure(kExitFile, fmt::format("{}: the module gives no parameter document: {}",
-                                             DisplayPath(movie_), ResultText(result)));
+        throw Failure(kExitFile,
+                      Problem{movie_, "the module gives no parameter document", {}, result});
     }
     return host::text::ReadUtf8(text.get());
 }
@@ -156,9 +155,10 @@ std::pair<GUID, host::ParameterTrack> ClipParameters::Read(ParameterXml which) {
     std::string problem;
     const NCFRESULT result = host::ReadParameterDocument(Xml(which), document, problem);
     if (result < 0 || document.components.empty() || document.components[0].tracks.empty()) {
-        throw Failure(kExitFile,
-                      fmt::format("{}: the module's parameter document can't be read: {} {}",
-                                  DisplayPath(movie_), ResultText(result), problem));
+        throw Failure(
+            kExitFile,
+            Problem{
+                movie_, "the module's parameter document can't be read: " + problem, {}, result});
     }
     return {document.components[0].id, document.components[0].tracks[0]};
 }
@@ -199,8 +199,8 @@ void ClipParameters::Assign(const std::vector<std::string>& assignments) {
     for (const std::string& assignment : assignments) {
         const std::size_t equals = assignment.find('=');
         if (equals == std::string::npos) {
-            throw Failure(kExitCaller,
-                          fmt::format("--set {}: write it as \"name=value\"", assignment));
+            throw Failure(kExitCaller, "--set " + assignment, "it gives no value",
+                          "write it as \"name=value\"");
         }
         const host::ParameterInfo& info = FindParameter(infos, assignment.substr(0, equals));
         const ncfUInt32 value = FindValue(info, assignment.substr(equals + 1));
@@ -220,14 +220,13 @@ void ClipParameters::Assign(const std::vector<std::string>& assignments) {
     std::string xml;
     const NCFRESULT written = host::WriteParameterDocument({{{component, {changed}}}}, xml);
     if (written < 0) {
-        throw Failure(kExitFile, fmt::format("{}: its parameters can't be written: {}",
-                                             DisplayPath(movie_), ResultText(written)));
+        throw Failure(kExitFile, Problem{movie_, "its parameters can't be written", {}, written});
     }
-    HandOver(xml, kExitFile, DisplayPath(movie_) + ": the module refuses the values");
+    HandOver(xml, kExitFile, movie_, "the module refuses the values");
 }
 
 void ClipParameters::Apply(const std::string& xml, const std::filesystem::path& file) {
-    HandOver(xml, kExitCaller, DisplayPath(file) + ": refused");
+    HandOver(xml, kExitCaller, file, "the module refuses it");
     host::ParameterDocument document;
     std::string problem;
     if (host::ReadParameterDocument(xml, document, problem) >= 0 && !HoldsValues(document)) {
@@ -242,24 +241,23 @@ void ClipParameters::Apply(const std::string& xml, const std::filesystem::path& 
 void ClipParameters::Reset() {
     const NCFRESULT result = parameters_->ResetParameters();
     if (result < 0) {
-        throw Failure(kExitFile, fmt::format("{}: the parameters can't be reset: {}",
-                                             DisplayPath(movie_), ResultText(result)));
+        throw Failure(kExitFile, Problem{movie_, "the parameters can't be reset", {}, result});
     }
-    HandOver(Xml(ParameterXml::kDescription), kExitFile,
-             DisplayPath(movie_) + ": the module refuses its own values");
+    HandOver(Xml(ParameterXml::kDescription), kExitFile, movie_,
+             "the module refuses its own values");
 }
 
-void ClipParameters::HandOver(const std::string& xml, int status, const std::string& what) {
+void ClipParameters::HandOver(const std::string& xml, int status, const std::filesystem::path& file,
+                              const std::string& what) {
     session_.TakeNotices();
     const auto text = host::MakeString(xml, kNCFUTF8);
     const NCFRESULT result = parameters_->SetParameterValuesXML(text.get());
     const std::vector<std::string> notices = session_.TakeNotices();
     if (result < 0) {
-        std::string message = fmt::format("{}: {}", what, ResultText(result));
-        for (const std::string& notice : notices) {
-            message += "\n  " + notice;
-        }
-        throw Failure(status, message);
+        // What the parameters component says of the document names its place there.
+        throw Failure(
+            status,
+            Problem{file, notices.empty() ? what : what + ": " + notices.front(), {}, result});
     }
 }
 

@@ -49,7 +49,8 @@ public:
 private:
     // The one track of the module's component in a document of its own.
     std::pair<GUID, host::ParameterTrack> Read(ParameterXml which);
-    void HandOver(const std::string& xml, int status, const std::string& what);
+    void HandOver(const std::string& xml, int status, const std::filesystem::path& file,
+                  const std::string& what);
 
     Session& session_;
     std::filesystem::path movie_;

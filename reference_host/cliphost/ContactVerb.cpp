@@ -47,9 +47,9 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     RefuseOutputOntoMovie(options.output, options.movie);
     const std::string ending = options.output.extension().string();
     if (!ending.empty() && ending != ".png") {
-        throw Failure(kExitCaller, fmt::format("{}: '{}' is no ending that is written; give "
-                                               "FILE.png, or - for standard output",
-                                               DisplayPath(options.output), ending));
+        throw Failure(kExitCaller, options.output,
+                      fmt::format("'{}' is no ending that is written", ending),
+                      "give FILE.png, or - for standard output");
     }
     const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
     FrameReader reader(essence, track, "");
@@ -59,7 +59,7 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     }
     const auto frames = SpreadFrames(reader.Count(), static_cast<std::uint64_t>(options.frames));
     if (frames.empty() || reader.width() == 0) {
-        throw Failure(kExitFile, fmt::format("{}: it has no frames", DisplayPath(options.movie)));
+        throw Failure(kExitFile, options.movie, "it has no frames");
     }
     ContactSheet sheet(static_cast<int>(frames.size()), options.columns, options.width,
                        CellHeight(options, track, reader));
@@ -82,8 +82,7 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
         sheet.Add(picture);
     }
     if (failed == frames.size()) {
-        throw Failure(kExitFile, fmt::format("{}: no frame could be read, so there is no sheet",
-                                             DisplayPath(options.movie)));
+        throw Failure(kExitFile, options.movie, "no frame could be read, so there is no sheet");
     }
     const std::vector<unsigned char> png = ToPng(sheet.picture());
     OutputFile output(options.output);

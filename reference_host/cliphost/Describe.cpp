@@ -3,14 +3,9 @@
 
 #include "reference_host/cliphost/Describe.h"
 
-#include <fmt/format.h>
-
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/PluginComponents.h"
-#include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
-#include "reference_host/cliphost/ResultText.h"
-#include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
 namespace {
@@ -18,8 +13,7 @@ namespace {
 void Finish(Session& session, Description& description) {
     if (description.result < 0) {
         description.file.Reset();
-        description.problem =
-            ProblemWith(session, description.movie, "not described", description.result);
+        description.problem = ProblemWith(session, description.movie, description.result);
     } else {
         session.TakeNotices();
     }
@@ -27,22 +21,14 @@ void Finish(Session& session, Description& description) {
 
 }  // namespace
 
-std::string ProblemWith(Session& session, const std::filesystem::path& movie, const char* what,
-                        NCFRESULT result) {
-    std::string text =
-        fmt::format("{}: {}: {}", host::DisplayPath(movie), what, ResultText(result));
-    for (const std::string& notice : session.TakeNotices()) {
-        text += "\n  the module said: " + notice;
+Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRESULT result) {
+    session.TakeNotices();
+    for (const std::filesystem::path& file : session.MissingDataFiles()) {
+        return {file, "this data file is missing", "put it back beside the module", result};
     }
-    const std::vector<std::string> missing = session.MissingDataFiles();
-    for (const std::string& file : missing) {
-        text +=
-            fmt::format("\n  {}: this data file is missing; put it back beside the module", file);
-    }
-    if (missing.empty()) {
-        text += "\n  " + DiagnoseMovie(movie);
-    }
-    return text;
+    Problem problem = DiagnoseMovie(movie);
+    problem.code = result;
+    return problem;
 }
 
 NCFRESULT OpenContainer(Session& session, const std::filesystem::path& movie,

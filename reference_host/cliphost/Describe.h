@@ -6,6 +6,7 @@
 #include <string>
 
 #include "host_interfaces/media/MediaContainer.h"
+#include "reference_host/cliphost/Problem.h"
 #include "reference_host/cliphost/Session.h"
 
 namespace cliphost {
@@ -15,7 +16,7 @@ struct Description {
     std::filesystem::path movie;
     AafRef<IAAFFile> file;  // empty on failure
     NCFRESULT result = NCF_OK;
-    std::string problem;  // for the user, names the movie
+    Problem problem;  // names the movie
 };
 
 // Opens a movie through the module's container and lets it be described.
@@ -30,9 +31,8 @@ Description DescribeContainer(Session& session, NMA::IMediaContainer3* container
 Description DescribeFromList(Session& session, NMA::IAAFClips* list, ncfSInt32 index,
                              const std::filesystem::path& movie);
 
-// For the user: what the module would not do with a movie, why, and what would
-// help. Takes the session's notices.
-std::string ProblemWith(Session& session, const std::filesystem::path& movie, const char* what,
-                        NCFRESULT result);
+// Why the module did not describe or open a movie, and what would help. Takes the
+// session's notices.
+Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRESULT result);
 
 }  // namespace cliphost

@@ -3,17 +3,15 @@
 
 #include <fmt/format.h>
 
-#include <nlohmann/json.hpp>
 #include <set>
 
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Describe.h"
-#include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FolderClips.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Progress.h"
-#include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -44,7 +42,7 @@ private:
     // Does a step; what it fails with is told, and the next one goes on.
     template <class Step>
     void GoOnAfterFailure(const std::filesystem::path& path, const Step& step);
-    void Refuse(const nlohmann::ordered_json& entry);
+    void Refuse(const std::filesystem::path& path, const Problem& problem);
     std::filesystem::path TargetFor(const std::filesystem::path& movie);
 
     Session& session_;
@@ -61,9 +59,8 @@ int DescribeRun::Run() {
         std::error_code error;
         std::filesystem::create_directories(options_.outFolder, error);
         if (error) {
-            throw Failure(kExitCaller,
-                          fmt::format("{}: the folder can't be made: {}",
-                                      DisplayPath(options_.outFolder), error.message()));
+            throw Failure(kExitCaller, options_.outFolder,
+                          "the folder can't be made: " + error.message());
         }
     }
     for (const std::filesystem::path& path : options_.paths) {
@@ -73,7 +70,7 @@ int DescribeRun::Run() {
             path, [&] { isFolder ? DescribeFolder(path) : Take(DescribeMovie(session_, path)); });
     }
     if (options_.json) {
-        fmt::print("{}\n", json_.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
+        PrintJson(json_);
     } else if (described_ + failed_ != 1) {
         fmt::print("{} described, {} not\n", described_, failed_);
     }
@@ -87,21 +84,22 @@ void DescribeRun::GoOnAfterFailure(const std::filesystem::path& path, const Step
         step();
     } catch (const Failure& failure) {
         statusOfFailure_ = failure.status();
-        Refuse({{"movie", DisplayPath(path)}, {"problem", failure.what()}});
+        Refuse(path, failure.problem());
     }
 }
 
-void DescribeRun::Refuse(const nlohmann::ordered_json& entry) {
+void DescribeRun::Refuse(const std::filesystem::path& path, const Problem& problem) {
     ++failed_;
-    Notice("cliphost: {}\n", entry["problem"].get<std::string>());
-    json_.push_back(entry);
+    TellProblem(problem, session_.verbosity());
+    nlohmann::ordered_json entry = {{"movie", DisplayPath(path)}};
+    AddProblem(problem, entry);
+    json_.push_back(std::move(entry));
 }
 
 void DescribeRun::DescribeFolder(const std::filesystem::path& folder) {
     const auto path = PathForModule(folder);
     if (!IsClaimed(session_, path.get())) {
-        throw Failure(kExitFile, fmt::format("{}: not claimed: no file there is named *.mov",
-                                             DisplayPath(folder)));
+        throw Failure(kExitFile, folder, "not claimed: no file there is named *.mov");
     }
     const FolderClips clips(session_, path.get());
     Progress progress("describing", clips.clips().size());
@@ -115,9 +113,7 @@ void DescribeRun::DescribeFolder(const std::filesystem::path& folder) {
 
 void DescribeRun::Take(const Description& description) {
     if (!description.file) {
-        Refuse({{"movie", DisplayPath(description.movie)},
-                {"result", ResultName(description.result)},
-                {"problem", description.problem}});
+        Refuse(description.movie, description.problem);
         return;
     }
     std::filesystem::path saved;
@@ -185,7 +181,7 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     verb->callback([&session, &status, options, pinned] {
         if (!options->aafFile.empty() &&
             (options->paths.size() != 1 || std::filesystem::is_directory(options->paths[0]))) {
-            throw Failure(kExitCaller, "--aaf takes one movie; use --out-dir for several");
+            throw Failure(kExitCaller, "--aaf", "it takes one movie", "use --out-dir for several");
         }
         SessionOptions withTime = session;
         withTime.pinTime = *pinned;

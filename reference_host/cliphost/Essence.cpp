@@ -8,7 +8,6 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/Notice.h"
-#include "reference_host/cliphost/ResultText.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -37,7 +36,7 @@ Essence::Essence(Session& session, std::filesystem::path movie, const ParameterO
     host::Ref<NMA::IMediaContainer3> container;
     const NCFRESULT opened = OpenContainer(session_, movie_, container);
     if (opened < 0) {
-        Fail("not opened", opened);
+        throw Failure(kExitFile, ProblemWith(session_, movie_, opened));
     }
     const Description description = DescribeContainer(session_, container.get(), movie_);
     undescribed_ = description.problem;
@@ -51,11 +50,9 @@ Essence::Essence(Session& session, std::filesystem::path movie, const ParameterO
 void Essence::Map(NMA::IMediaContainer3& container) {
     const NCFRESULT mapped = container.GetSampleMapping(map_.Out());
     const NCFRESULT provided = mapped < 0 ? mapped : Ask(map_.get(), provider_);
-    if (provided < 0 && !undescribed_.empty()) {
-        throw Failure(kExitFile, undescribed_);
-    }
     if (provided < 0) {
-        Fail("no sample map", provided);
+        throw Failure(kExitFile,
+                      undescribed_ ? undescribed_ : ProblemWith(session_, movie_, provided));
     }
 }
 
@@ -126,18 +123,17 @@ const ClipTrack& Essence::Track(std::optional<ncfUInt32> number, TrackKind kind)
         if (const ClipTrack* const track = First(kind)) {
             return *track;
         }
-        throw Failure(kExitFile, fmt::format("{}: it has no {} track; {}", DisplayPath(movie_),
-                                             NameOf(kind), TrackList()));
+        throw Failure(kExitFile, movie_, fmt::format("it has no {} track", NameOf(kind)),
+                      TrackList());
     }
     if (*number >= tracks_.size()) {
-        throw Failure(kExitCaller, fmt::format("{}: there is no track {}; {}", DisplayPath(movie_),
-                                               *number, TrackList()));
+        throw Failure(kExitCaller, movie_, fmt::format("there is no track {}", *number),
+                      TrackList());
     }
     const ClipTrack& track = tracks_[*number];
     if (wantsSound != (track.kind == TrackKind::Sound)) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: track {} is no {} track; {}", DisplayPath(movie_), *number,
-                                  NameOf(kind), TrackList()));
+        throw Failure(kExitCaller, movie_,
+                      fmt::format("track {} is no {} track", *number, NameOf(kind)), TrackList());
     }
     return track;
 }
@@ -154,38 +150,45 @@ std::string Essence::TrackList() const {
 // The module keeps every picture track of a movie and tells the host of the
 // first alone. Behind a second one the sounds have other numbers on its two
 // sides, and a request for sound would reach a picture.
-std::string Essence::Obstacle(const ClipTrack& track) {
+Problem Essence::Obstacle(const ClipTrack& track) {
     ncfUInt32 count = 0;
     if (track.kind != TrackKind::Sound) {
         return {};
     }
     const NCFRESULT result = sounds().GetNumberOfAudioFormats(track.number, &count);
     if (result == NCF_E_INVALIDARG) {
-        return "the movie has more than one picture track, and the module counts the further ones "
-               "before the sound, so this sound can't be delivered; take the sound out of the "
-               "movie, for instance with ffmpeg -i FILE -map 0:a -c copy SOUND.mov";
+        return {movie_,
+                fmt::format("track {}: the movie has more than one picture track, and the module "
+                            "counts the further ones before the sound, so this sound can't be "
+                            "delivered",
+                            track.number),
+                "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c "
+                "copy SOUND.mov",
+                result};
     }
-    return result < 0 ? "no sound formats: " + ResultText(result) : std::string();
+    if (result < 0) {
+        return {movie_, fmt::format("track {}: no sound formats", track.number), {}, result};
+    }
+    return {};
 }
 
 void Essence::NeedDelivery(const ClipTrack& track) {
-    const std::string obstacle = Obstacle(track);
-    if (!obstacle.empty()) {
-        throw Failure(kExitFile,
-                      fmt::format("{}: track {}: {}", DisplayPath(movie_), track.number, obstacle));
+    const Problem obstacle = Obstacle(track);
+    if (obstacle) {
+        throw Failure(kExitFile, obstacle);
     }
 }
 
 void Essence::Fail(const std::string& what, NCFRESULT result) const {
-    throw Failure(kExitFile, ProblemWith(session_, movie_, what.c_str(), result));
+    throw Failure(kExitFile, Problem{movie_, what, {}, result});
 }
 
 Essence OpenEssence(Session& session, const std::filesystem::path& movie,
                     const ParameterOptions& parameters) {
     Essence essence(session, movie, parameters);
-    if (!essence.undescribed().empty()) {
-        Notice("cliphost: {}\n  what can be mapped is served all the same\n",
-               essence.undescribed());
+    if (essence.undescribed()) {
+        TellProblem(essence.undescribed(), session.verbosity());
+        Notice("  what can be mapped is served all the same\n");
     }
     return essence;
 }

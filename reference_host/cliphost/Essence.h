@@ -11,6 +11,7 @@
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
 #include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/Problem.h"
 #include "reference_host/cliphost/Session.h"
 
 namespace cliphost {
@@ -28,8 +29,8 @@ public:
     Session& session() const { return session_; }
     const std::filesystem::path& movie() const { return movie_; }
     const std::vector<ClipTrack>& tracks() const { return tracks_; }
-    // Why there is no description, empty when there is one.
-    const std::string& undescribed() const { return undescribed_; }
+    // Why there is no description; nothing when there is one.
+    const Problem& undescribed() const { return undescribed_; }
 
     NMA::ISampleMapping& map() const { return *map_; }
     NMA::ISampleProvider& provider() const { return *provider_; }
@@ -43,12 +44,12 @@ public:
     const ClipTrack& Track(std::optional<ncfUInt32> number, TrackKind kind) const;
     const ClipTrack* First(TrackKind kind) const;
 
-    // Why nothing of a track can be delivered, empty when it can.
-    std::string Obstacle(const ClipTrack& track);
+    // Why nothing of a track can be delivered; nothing when it can.
+    Problem Obstacle(const ClipTrack& track);
     // Throws a Failure with the obstacle.
     void NeedDelivery(const ClipTrack& track);
 
-    // A failure of the module over this movie.
+    // Throws a Failure for a step that the module refused.
     [[noreturn]] void Fail(const std::string& what, NCFRESULT result) const;
 
 private:
@@ -59,7 +60,7 @@ private:
     Session& session_;
     std::filesystem::path movie_;
     std::vector<ClipTrack> tracks_;
-    std::string undescribed_;
+    Problem undescribed_;
     host::Ref<NMA::ISampleMapping> map_;
     host::Ref<NMA::ISampleProvider> provider_;
     host::Ref<NMA::IUncompressedImageProvider> pictures_;

@@ -4,6 +4,9 @@
 
 #include <stdexcept>
 #include <string>
+#include <utility>
+
+#include "reference_host/cliphost/Problem.h"
 
 namespace cliphost {
 
@@ -12,16 +15,23 @@ inline constexpr int kExitFine = 0;
 inline constexpr int kExitFile = 1;    // the file's fault
 inline constexpr int kExitCaller = 2;  // the caller's fault
 
-// Ends a verb with a message for the user: what was tried, on what, what was
-// wrong and what would help.
+// Ends a verb with what the user and programs are told. what() is the line.
 class Failure : public std::runtime_error {
 public:
-    Failure(int status, const std::string& message)
-        : std::runtime_error(message), status_(status) {}
+    Failure(int status, Problem problem)
+        : std::runtime_error(LineOf(problem)), status_(status), problem_(std::move(problem)) {}
+    // Of a file, a folder or an option.
+    Failure(int status, std::filesystem::path subject, std::string reason, std::string hint = {})
+        : Failure(status, Problem{std::move(subject), std::move(reason), std::move(hint)}) {}
+    // Of none of these.
+    Failure(int status, std::string reason) : Failure(status, {}, std::move(reason)) {}
+
     int status() const { return status_; }
+    const Problem& problem() const { return problem_; }
 
 private:
     int status_;
+    Problem problem_;
 };
 
 }  // namespace cliphost

@@ -15,7 +15,7 @@ namespace {
 
 void Check(NCFRESULT result, const char* what) {
     if (result < 0) {
-        throw Failure(kExitFile, std::string(what) + ": " + ResultText(result));
+        throw Failure(kExitFile, Problem{{}, what, {}, result});
     }
 }
 

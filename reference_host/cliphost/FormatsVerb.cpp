@@ -2,13 +2,10 @@
 // SPDX-License-Identifier: MIT
 #include <fmt/format.h>
 
-#include <nlohmann/json.hpp>
-
 #include "reference_host/cliphost/Essence.h"
-#include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ImageFormats.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/ParameterOptions.h"
-#include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -97,9 +94,8 @@ Json FormatsOf(Essence& essence) {
                      {"kind", NameOf(track.kind)},
                      {"length", track.length},
                      {"rate", RateText(track)}};
-        const std::string obstacle = essence.Obstacle(track);
-        if (!obstacle.empty()) {
-            json["obstacle"] = obstacle;
+        if (const Problem obstacle = essence.Obstacle(track)) {
+            AddProblem(obstacle, json);
         } else if (track.kind == TrackKind::Sound) {
             AddSound(essence, track, json);
         } else {
@@ -123,8 +119,10 @@ void PrintTrack(const Json& track) {
         fmt::print(", {} channels", track["channels"].get<int>());
     }
     fmt::print("\n");
-    if (track.contains("obstacle")) {
-        fmt::print("  {}\n", track["obstacle"].get<std::string>());
+    if (track.contains("reason")) {
+        const bool hasHint = track["hint"].is_string();
+        fmt::print("  {}{}\n", track["reason"].get<std::string>(),
+                   hasHint ? "; " + track["hint"].get<std::string>() : "");
         return;
     }
     for (const Json& one : track["formats"]) {
@@ -134,6 +132,18 @@ void PrintTrack(const Json& track) {
     }
     if (track["formats"].empty()) {
         fmt::print("  no format is offered\n");
+    }
+}
+
+void Show(Essence& essence, bool json) {
+    const Json list = FormatsOf(essence);
+    if (json) {
+        PrintJson({{"movie", host::DisplayPath(essence.movie())}, {"tracks", list}});
+        return;
+    }
+    fmt::print("{}\n", host::DisplayPath(essence.movie()));
+    for (const Json& track : list) {
+        PrintTrack(track);
     }
 }
 
@@ -150,18 +160,11 @@ void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
     verb->add_flag("--json", *json, "As JSON");
     parameters->AddTo(*verb);
     verb->callback([&session, movie, json, parameters] {
-        Session running(session);
-        Essence essence = OpenEssence(running, *movie, *parameters);
-        const Json list = FormatsOf(essence);
-        if (*json) {
-            fmt::print("{}\n", Json{{"movie", host::DisplayPath(*movie)}, {"tracks", list}}.dump(
-                                   2, ' ', false, Json::error_handler_t::replace));
-            return;
-        }
-        fmt::print("{}\n", host::DisplayPath(*movie));
-        for (const Json& track : list) {
-            PrintTrack(track);
-        }
+        AnswerFailureToo(*json, {{"movie", host::DisplayPath(*movie)}}, [&] {
+            Session running(session);
+            Essence essence = OpenEssence(running, *movie, *parameters);
+            Show(essence, *json);
+        });
     });
 }
 

@@ -18,7 +18,9 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     NMA::IUncompressedImageProvider& pictures = essence_.pictures();
     NCFRESULT result = pictures.SetWorkingImageFormat(track_.number, format_.index);
     if (result < 0) {
-        essence_.Fail("the format can't be set", result);
+        essence_.Fail(
+            fmt::format("track {}: the format {} can't be set", track_.number, NameOf(format_)),
+            result);
     }
     ncfUInt32 width = 0, fieldHeight = 0;
     ncfUInt16 alignment = 0;
@@ -28,7 +30,7 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
         result = pictures.GetWorkingImageBufferRequirements(track_.number, &alignment, &size);
     }
     if (result < 0) {
-        essence_.Fail("no picture size", result);
+        essence_.Fail(fmt::format("track {}: no picture size", track_.number), result);
     }
     // The size told is that of a field where there are two; the buffer always
     // holds a frame.
@@ -38,7 +40,7 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     frameBytes_ = size;
     result = essence_.provider().Setup(track_.number);
     if (result < 0) {
-        essence_.Fail("the reader does not start", result);
+        essence_.Fail(fmt::format("track {}: the reader does not start", track_.number), result);
     }
 }
 
@@ -50,7 +52,7 @@ void FrameReader::Choose(const std::string& formatName) {
     std::vector<ImageFormat> formats;
     const NCFRESULT result = ReadImageFormats(essence_.pictures(), track_.number, formats);
     if (result < 0) {
-        essence_.Fail("no picture formats", result);
+        essence_.Fail(fmt::format("track {}: no picture formats", track_.number), result);
     }
     if (const ImageFormat* const chosen = ChooseFormat(formats, formatName)) {
         format_ = *chosen;
@@ -60,14 +62,15 @@ void FrameReader::Choose(const std::string& formatName) {
     for (const ImageFormat& one : formats) {
         offered += (offered.empty() ? "" : ", ") + NameOf(one);
     }
-    const std::string file = host::DisplayPath(essence_.movie());
     if (offered.empty()) {
-        throw Failure(kExitFile, fmt::format("{}: track {}: the module offers no format of it; "
-                                             "its codec may be unknown",
-                                             file, track_.number));
+        throw Failure(kExitFile, essence_.movie(),
+                      fmt::format("track {}: the module offers no format of it; its codec may be "
+                                  "unknown",
+                                  track_.number));
     }
-    throw Failure(kExitCaller, fmt::format("{}: track {}: there is no format '{}'; it offers {}",
-                                           file, track_.number, formatName, offered));
+    throw Failure(kExitCaller, essence_.movie(),
+                  fmt::format("track {}: there is no format '{}'", track_.number, formatName),
+                  "it offers " + offered);
 }
 
 std::uint64_t FrameReader::MostFrames() const {

@@ -23,10 +23,10 @@ void WritePng(const std::filesystem::path& file, const FrameReader& reader,
     }
     const std::vector<unsigned char> png = ToPng(picture);
     if (png.empty()) {
-        throw Failure(kExitFile, fmt::format("{}: a picture of {} x {} in the format {} can't be "
-                                             "made a PNG file; take a .raw file",
-                                             DisplayPath(file), reader.width(), reader.height(),
-                                             reader.layout().name));
+        throw Failure(kExitFile, file,
+                      fmt::format("a picture of {} x {} in the format {} can't be made a PNG file",
+                                  reader.width(), reader.height(), reader.layout().name),
+                      "take a .raw file");
     }
     OutputFile output(file);
     output.Write(png.data(), png.size());
@@ -80,8 +80,7 @@ public:
         std::error_code error;
         std::filesystem::create_directories(folder_, error);
         if (error) {
-            throw Failure(kExitCaller, fmt::format("{}: the folder can't be made: {}",
-                                                   DisplayPath(folder_), error.message()));
+            throw Failure(kExitCaller, folder_, "the folder can't be made: " + error.message());
         }
     }
 
@@ -120,15 +119,12 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
         if (isOneFrame) {
             return std::make_unique<PngSink>(output);
         }
-        throw Failure(kExitCaller, fmt::format("{}: a PNG file holds one frame; give a folder or a "
-                                               ".raw file for a range",
-                                               DisplayPath(output)));
+        throw Failure(kExitCaller, output, "a PNG file holds one frame",
+                      "give a folder or a .raw file for a range");
     }
     if (!ending.empty()) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: '{}' is no ending that is written; give FILE.png, FILE.raw, "
-                                  "a folder, or - for standard output",
-                                  DisplayPath(output), ending));
+        throw Failure(kExitCaller, output, fmt::format("'{}' is no ending that is written", ending),
+                      "give FILE.png, FILE.raw, a folder, or - for standard output");
     }
     return std::make_unique<FolderSink>(output, movie.stem());
 }

@@ -61,10 +61,9 @@ FrameRange FrameRun::WantedFrames() {
     const bool isCertain = options_.range.empty() && range.first < reader_.MostFrames();
     const std::uint64_t count = isCertain ? range.first + 1 : reader_.Count();
     if (range.CountIn(count) == 0) {
-        throw Failure(
-            kExitCaller,
-            fmt::format("{}: track {}: there is no frame {}; it has {}, from 0 on",
-                        DisplayPath(essence_.movie()), track_.number, range.first, count));
+        throw Failure(kExitCaller, essence_.movie(),
+                      fmt::format("track {}: there is no frame {}", track_.number, range.first),
+                      fmt::format("it has {}, from 0 on", count));
     }
     range.end = std::min(range.end.value_or(count), count);
     return range;
@@ -79,9 +78,9 @@ int FrameRun::Run() {
     const std::uint64_t count = range.CountIn(*range.end);
     const auto sink = MakeFrameSink(options_.output, options_.movie, count == 1);
     if (sink->IsRaw() && options_.withAlpha) {
-        throw Failure(kExitCaller,
-                      "--with-alpha is for PNG files; raw frames of the alpha are "
-                      "those of its own track, see `cliphost formats --use-alpha`");
+        throw Failure(kExitCaller, options_.output, "--with-alpha is for PNG files",
+                      "raw frames of the alpha are those of its own track, see `cliphost formats "
+                      "--use-alpha`");
     }
     if (sink->IsRaw()) {
         Notice("{}\n", RawWords(reader_, track_));

@@ -94,53 +94,65 @@ std::string HeaderProblem(std::ifstream& stream) {
 
 }  // namespace
 
-std::string DiagnoseMovie(const std::filesystem::path& movie) {
+Problem DiagnoseMovie(const std::filesystem::path& movie) {
     std::error_code error;
     const auto status = std::filesystem::status(movie, error);
     if (std::filesystem::is_directory(status)) {
-        return "this is a folder; give a movie in it";
+        return {movie, "this is a folder", "give a movie in it"};
     }
     // A pipe would keep us waiting.
     if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)) {
-        return "this is no file but a pipe or device; copy what comes from it into a file";
+        return {movie, "this is no file but a pipe or device",
+                "copy what comes from it into a file"};
     }
     const std::uintmax_t size = std::filesystem::file_size(movie, error);
     std::ifstream stream(movie, std::ios::binary);
     if (error || !stream) {
-        return "the file can't be read; look at its permissions";
+        return {movie, "the file can't be read", "look at its permissions"};
     }
     if (size == 0) {
-        return "the file is empty; copy it again from where it came";
+        return {movie, "the file is empty", "copy it again from where it came"};
     }
     const TopLevel top = ReadTopLevel(stream, size);
     const std::string opening = host::OpenProblem(movie);
+    const char* const way = opening.empty() ? route::kLibrary : route::kNone;
+    const auto because = [&](std::string reason, std::string hint) {
+        return Problem{movie, std::move(reason), std::move(hint), NCF_OK, way};
+    };
     if (!top.isFamily && !opening.empty()) {
-        return fmt::format(
-            "the file is no movie of the QuickTime family, and can't be opened as another kind of "
-            "movie, sound or picture either ({}); convert it to .mov or .mp4",
-            opening);
+        return because(
+            fmt::format("the file is no movie of the QuickTime family, and can't be opened as "
+                        "another kind of movie, sound or picture either ({})",
+                        opening),
+            "convert it to .mov or .mp4");
     }
     if (top.isFamily && top.cutAtom == "moov") {
-        return fmt::format("the movie header is cut off at {} bytes; copy the file again", size);
+        return because(fmt::format("the movie header is cut off at {} bytes", size),
+                       "copy the file again");
     }
     if (top.isFamily && top.atoms.count("moov") == 0) {
         return top.cutAtom.empty()
-                   ? "the file holds no movie header ('moov'), so nothing tells its tracks"
-                   : fmt::format(
-                         "the file ends inside its '{}' atom, before any movie header; "
-                         "copy it again",
-                         top.cutAtom);
+                   ? because("the file holds no movie header ('moov'), so nothing tells its tracks",
+                             {})
+                   : because(
+                         fmt::format("the file ends inside its '{}' atom, before any movie header",
+                                     top.cutAtom),
+                         "copy it again");
     }
     if (opening.empty() && top.atoms.count("moof") > 0) {
-        return "the movie is fragmented, and nothing of use is in its fragments; make it again "
-               "from where it came";
+        return because("the movie is fragmented, and nothing of use is in its fragments",
+                       "make it again from where it came");
     }
     if (opening.empty()) {
-        return "the file can be opened, but it holds neither picture nor sound, or its length is "
-               "not above 0, or it is longer than the 24 hours that its timecode can count";
+        return because(
+            "the file can be opened, but it holds neither picture nor sound, or its length is not "
+            "above 0, or it is longer than the 24 hours that its timecode can count",
+            {});
     }
-    return fmt::format("the movie header can't be used: {}; nor can it be read another way: {}",
-                       HeaderProblem(stream), opening);
+    return because(
+        fmt::format("the movie header can't be used: {}; nor can it be read another way: {}",
+                    HeaderProblem(stream), opening),
+        {});
 }
 
 }  // namespace cliphost

@@ -3,13 +3,14 @@
 #pragma once
 
 #include <filesystem>
-#include <string>
+
+#include "reference_host/cliphost/Problem.h"
 
 namespace cliphost {
 
 // Looks at a file that could not be described and says in a sentence what is
 // the matter with it and what would help. The module gives one code for all of
 // this; the bytes tell more.
-std::string DiagnoseMovie(const std::filesystem::path& movie);
+Problem DiagnoseMovie(const std::filesystem::path& movie);
 
 }  // namespace cliphost

@@ -77,8 +77,7 @@ void RefuseOutputOntoMovie(const std::filesystem::path& output,
                            const std::filesystem::path& movie) {
     std::error_code ignored;
     if (output != "-" && std::filesystem::equivalent(output, movie, ignored)) {
-        throw Failure(kExitCaller, fmt::format("{}: this is the movie itself; name another file",
-                                               host::DisplayPath(output)));
+        throw Failure(kExitCaller, output, "this is the movie itself", "name another file");
     }
 }
 

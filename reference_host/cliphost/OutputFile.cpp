@@ -78,10 +78,8 @@ void OutputFile::Finish() {
 }
 
 void OutputFile::Fail(int error) {
-    throw Failure(kExitCaller, fmt::format("{}: not written: {}",
-                                           IsStandardOutput(path_) ? "standard output"
-                                                                   : host::DisplayPath(path_),
-                                           std::generic_category().message(error)));
+    throw Failure(kExitCaller, IsStandardOutput(path_) ? "standard output" : path_,
+                  "not written: " + std::generic_category().message(error));
 }
 
 void OutputFile::Close() {

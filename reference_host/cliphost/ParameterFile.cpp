@@ -10,17 +10,15 @@
 #include <fstream>
 
 #include "reference_host/cliphost/Failure.h"
-#include "reference_host/framework/HostPath.h"
 #include "reference_host/parameters/ParameterDocument.h"
 #include "reference_host/util/text/Encodings.h"
 
 namespace cliphost {
 namespace {
 
-using host::DisplayPath;
-
-[[noreturn]] void Refuse(const std::filesystem::path& file, const std::string& what) {
-    throw Failure(kExitCaller, fmt::format("{}: {}", DisplayPath(file), what));
+[[noreturn]] void Refuse(const std::filesystem::path& file, const std::string& what,
+                         const std::string& hint = {}) {
+    throw Failure(kExitCaller, file, what, hint);
 }
 
 std::string ReadBytes(const std::filesystem::path& file) {
@@ -92,7 +90,7 @@ std::string ReadParameterFile(const std::filesystem::path& file) {
     }
     const std::string claimed = ClaimedEncoding(bytes);
     if (!claimed.empty() && claimed != "utf-8" && claimed != "us-ascii") {
-        Refuse(file, fmt::format("claims the encoding {}; save it as UTF-8", claimed));
+        Refuse(file, fmt::format("claims the encoding {}", claimed), "save it as UTF-8");
     }
     return bytes;
 }

@@ -4,10 +4,9 @@
 #include <fmt/format.h>
 
 #include <map>
-#include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/Describe.h"
-#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
@@ -97,7 +96,7 @@ void Print(ClipParameters& parameters, const ParamsOptions& options) {
     for (const ClipParameter& parameter : list) {
         json["parameters"].push_back(ToJson(parameter));
     }
-    fmt::print("{}\n", json.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
+    PrintJson(json);
 }
 
 }  // namespace
@@ -114,15 +113,17 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
     xml->check(CLI::IsMember(kXml));
     verb->add_flag("--json", options->json, "As JSON")->excludes(xml);
     verb->callback([&session, options] {
-        Session running(session);
-        host::Ref<NMA::IMediaContainer3> container;
-        const NCFRESULT opened = OpenContainer(running, options->movie, container);
-        if (opened < 0) {
-            throw Failure(kExitFile, ProblemWith(running, options->movie, "not opened", opened));
-        }
-        ClipParameters parameters(running, options->movie, *container);
-        options->parameters.ApplyTo(parameters);
-        Print(parameters, *options);
+        AnswerFailureToo(options->json, {{"movie", DisplayPath(options->movie)}}, [&] {
+            Session running(session);
+            host::Ref<NMA::IMediaContainer3> container;
+            const NCFRESULT opened = OpenContainer(running, options->movie, container);
+            if (opened < 0) {
+                throw Failure(kExitFile, ProblemWith(running, options->movie, opened));
+            }
+            ClipParameters parameters(running, options->movie, *container);
+            options->parameters.ApplyTo(parameters);
+            Print(parameters, *options);
+        });
     });
 }
 

@@ -3,9 +3,8 @@
 
 #include <fmt/format.h>
 
-#include <nlohmann/json.hpp>
-
 #include "reference_host/cliphost/AafValue.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -36,7 +35,7 @@ void PrintText(const Session& session) {
                session.aaf().Version());
 }
 
-void PrintJson(const Session& session) {
+nlohmann::ordered_json ToJson(const Session& session) {
     const host::PluginModule& module = session.plugin();
     const host::PluginFacts& plugin = module.plugin();
     nlohmann::ordered_json json = {
@@ -56,7 +55,7 @@ void PrintJson(const Session& session) {
              {"classId", ToText(component.classId)},
              {"classFactory", component.hasFactory}});
     }
-    fmt::print("{}\n", json.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
+    return json;
 }
 
 }  // namespace
@@ -69,7 +68,7 @@ void AddPlugin(CLI::App& app, const SessionOptions& options, int&) {
     verb->callback([&options, json] {
         const Session session(options);
         if (*json) {
-            PrintJson(session);
+            PrintJson(ToJson(session));
         } else {
             PrintText(session);
         }

@@ -2,13 +2,10 @@
 // SPDX-License-Identifier: MIT
 #include <fmt/format.h>
 
-#include <nlohmann/json.hpp>
-
 #include "reference_host/cliphost/Essence.h"
-#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Progress.h"
-#include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/SampleMap.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
@@ -136,7 +133,7 @@ void SamplesRun::ShowTrack(const ClipTrack& track) {
     }
     ncfUInt32 channels = 0;
     Json json = {{"track", track.number}, {"kind", NameOf(track.kind)}, {"samples", runs.samples}};
-    const bool hasChannels = track.kind == TrackKind::Sound && essence_.Obstacle(track).empty() &&
+    const bool hasChannels = track.kind == TrackKind::Sound && !essence_.Obstacle(track) &&
                              essence_.map().GetNumberOfChannels(track.number, &channels) >= 0;
     if (hasChannels) {
         json["channels"] = channels;
@@ -164,16 +161,14 @@ int SamplesRun::Run() {
         }
     }
     if (tracks_.empty()) {
-        throw Failure(
-            kExitCaller,
-            fmt::format("{}: there is no track {}; it has {}", host::DisplayPath(options_.movie),
-                        options_.track.value_or(0), essence_.tracks().size()));
+        throw Failure(kExitCaller, options_.movie,
+                      fmt::format("there is no track {}", options_.track.value_or(0)),
+                      fmt::format("it has {}", essence_.tracks().size()));
     }
     if (options_.json) {
-        fmt::print("{}\n", Json{{"movie", host::DisplayPath(options_.movie)},
-                                {"fileBytes", fileSize_},
-                                {"tracks", tracks_}}
-                               .dump(2, ' ', false, Json::error_handler_t::replace));
+        PrintJson({{"movie", host::DisplayPath(options_.movie)},
+                   {"fileBytes", fileSize_},
+                   {"tracks", tracks_}});
     }
     return isSound_ ? kExitFine : kExitFile;
 }
@@ -194,9 +189,11 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_flag("--every", options->every, "Each sample of sound too, not its runs");
     verb->add_flag("--json", options->json, "As JSON");
     verb->callback([&session, &status, options] {
-        Session running(session);
-        Essence essence = OpenEssence(running, options->movie);
-        status = SamplesRun(essence, *options).Run();
+        AnswerFailureToo(options->json, {{"movie", host::DisplayPath(options->movie)}}, [&] {
+            Session running(session);
+            Essence essence = OpenEssence(running, options->movie);
+            status = SamplesRun(essence, *options).Run();
+        });
     });
 }
 

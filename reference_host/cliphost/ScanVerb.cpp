@@ -4,13 +4,11 @@
 #include <fmt/format.h>
 
 #include <ctime>
-#include <nlohmann/json.hpp>
 
 #include "host_interfaces/media/MediaVolume.h"
 #include "host_interfaces/media/PluginComponents.h"
-#include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FolderClips.h"
-#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/HostText.h"
@@ -65,19 +63,17 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
     verb->add_flag("--json", *json, "As JSON");
     verb->callback([&options, &status, folder, json] {
         if (!std::filesystem::is_directory(*folder)) {
-            throw Failure(kExitCaller, fmt::format("{}: is no folder; `cliphost describe` takes "
-                                                   "single movies",
-                                                   host::DisplayPath(*folder)));
+            throw Failure(kExitCaller, *folder, "is no folder",
+                          "`cliphost describe` takes single movies");
         }
         Session session(options);
         const FolderFacts facts = Scan(session, *folder);
         status = facts.claimed ? kExitFine : kExitFile;
         if (*json) {
-            fmt::print("{}\n", nlohmann::ordered_json{{"claimed", facts.claimed},
-                                                      {"name", facts.name},
-                                                      {"newest", facts.newest},
-                                                      {"movies", facts.movies}}
-                                   .dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
+            PrintJson({{"claimed", facts.claimed},
+                       {"name", facts.name},
+                       {"newest", facts.newest},
+                       {"movies", facts.movies}});
             return;
         }
         if (!facts.claimed) {

@@ -46,8 +46,8 @@ aafTimeStamp_t ParseTime(const std::string& text) {
                                            &day, &hour, &minute, &second) == 6;
     if (!isTime || year < 1 || month < 1 || month > 12 || day < 1 || day > DaysIn(year, month) ||
         hour > 23 || minute > 59 || second > 59) {
-        throw Failure(kExitCaller,
-                      fmt::format("--pin-time {}: not a time; write 2026-01-31T12:00:00Z", text));
+        throw Failure(kExitCaller, "--pin-time " + text, "not a time",
+                      "write 2026-01-31T12:00:00Z");
     }
     aafTimeStamp_t time{};
     time.date = {static_cast<aafInt16>(year), static_cast<aafUInt8>(month),
@@ -66,23 +66,22 @@ std::string WithoutLineEnd(std::string text) {
 
 }  // namespace
 
-Session::Session(const SessionOptions& options) {
+Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) {
     aaf_ = std::make_unique<AafLibrary>(
         options.aafLibrary.empty() ? options.programFolder / kAAFLibraryName : options.aafLibrary);
     if (!options.pinTime.empty() && !aaf_->PinTime(ParseTime(options.pinTime))) {
-        throw Failure(kExitCaller, fmt::format("{}: this AAF library can't pin its time stamps",
-                                               DisplayPath(aaf_->file())));
+        throw Failure(kExitCaller, aaf_->file(), "this AAF library can't pin its time stamps",
+                      "leave out --pin-time");
     }
     NMASetLogLevel(options.verbosity >= 2 ? 8 : options.verbosity == 1 ? 1 : 0);
 
     host_ = std::make_unique<host::Host>(options.host);
-    const int verbosity = options.verbosity;
-    host_->console().SetSink([this, verbosity](ncfUInt32 level, const std::string& text) {
+    host_->console().SetSink([this](ncfUInt32 level, const std::string& text) {
         const std::string line = WithoutLineEnd(text);
         if (level <= 2) {
             notices_.push_back(line);
         }
-        if (verbosity > 0) {
+        if (verbosity_ > 0) {
             Notice("console {}: {}\n", level, line);
         }
     });
@@ -109,12 +108,12 @@ std::vector<std::string> Session::TakeNotices() {
     return std::exchange(notices_, {});
 }
 
-std::vector<std::string> Session::MissingDataFiles() const {
-    std::vector<std::string> missing;
+std::vector<std::filesystem::path> Session::MissingDataFiles() const {
+    std::vector<std::filesystem::path> missing;
     for (const char* const name : {"FourCharMapper.xml", "AAFInfo.xml"}) {
         const std::filesystem::path file = plugin_->file().parent_path() / name;
         if (!std::filesystem::is_regular_file(file)) {
-            missing.push_back(DisplayPath(file));
+            missing.push_back(file);
         }
     }
     return missing;
@@ -125,14 +124,13 @@ host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
     const std::filesystem::path absolute =
         std::filesystem::absolute(path, error).lexically_normal();
     if (!error && !std::filesystem::exists(absolute, error)) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: there is no such file or folder", DisplayPath(path)));
+        throw Failure(kExitCaller, path, "there is no such file or folder");
     }
     if (host::text::HoldsBackslash(absolute)) {
-        throw Failure(kExitCaller,
-                      fmt::format("{}: a name with a backslash in it can't be passed to the "
-                                  "module, which separates folders by it; rename it",
-                                  DisplayPath(path)));
+        throw Failure(kExitCaller, path,
+                      "a name with a backslash in it can't be passed to the module, which "
+                      "separates folders by it",
+                      "rename it");
     }
     return host::ModulePath(absolute);
 }

@@ -33,13 +33,15 @@ public:
     host::Host& host() { return *host_; }
     const host::PluginModule& plugin() const { return *plugin_; }
     const AafLibrary& aaf() const { return *aaf_; }
+    int verbosity() const { return verbosity_; }
 
     // Lines that the module wrote for the user since the last call.
     std::vector<std::string> TakeNotices();
     // Files that the module needs beside it and that are not there.
-    std::vector<std::string> MissingDataFiles() const;
+    std::vector<std::filesystem::path> MissingDataFiles() const;
 
 private:
+    int verbosity_;
     std::vector<std::string> notices_;
     std::unique_ptr<AafLibrary> aaf_;
     std::unique_ptr<host::Host> host_;

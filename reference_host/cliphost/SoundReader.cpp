@@ -47,7 +47,8 @@ void SoundReader::SetFormat() {
             }
         }
     }
-    essence_.Fail("no sound format can be set", result < 0 ? result : NCF_E_NOTSUPPORTED);
+    essence_.Fail(fmt::format("track {}: no sound format can be set", track_.number),
+                  result < 0 ? result : NCF_E_NOTSUPPORTED);
 }
 
 SoundReader::Block SoundReader::Read(std::uint64_t first, std::uint64_t count) {
@@ -55,7 +56,7 @@ SoundReader::Block SoundReader::Read(std::uint64_t first, std::uint64_t count) {
     request_->Ask(track_.number, first, count);
     const NCFRESULT result = essence_.provider().ProvideSampleRange(request_.get(), 0);
     if (result != NCF_OK || !request_->buffer().isComplete()) {
-        essence_.Fail(fmt::format("no sound from sample {}", first),
+        essence_.Fail(fmt::format("track {}: no sound from sample {}", track_.number, first),
                       result < 0 ? result : NCF_E_FAIL);
     }
     Block block{request_->buffer().bytes(),

@@ -7,7 +7,7 @@
 
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/PluginComponents.h"
-#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/util/text/HostText.h"
@@ -24,7 +24,7 @@ void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
         host::Ref<NMA::IMediaContainer3> container;
         const NCFRESULT made = session.host().Create(NMA::CompID_QuickTimeContainer, container);
         if (made < 0) {
-            throw Failure(kExitCaller, "no container: " + ResultText(made));
+            throw Failure(kExitCaller, Problem{{}, "no container", {}, made});
         }
         nlohmann::ordered_json list = nlohmann::ordered_json::array();
         const ncfUInt32 count = container->GetFileTypeCount();
@@ -33,7 +33,7 @@ void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
             const NCFRESULT result =
                 container->GetFileType(i, extension.Out(), description.Out(), group.Out());
             if (result < 0) {
-                throw Failure(kExitCaller, "no file type: " + ResultText(result));
+                throw Failure(kExitCaller, Problem{{}, "no file type", {}, result});
             }
             if (*json) {
                 list.push_back({{"index", i},
@@ -47,7 +47,7 @@ void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
             }
         }
         if (*json) {
-            fmt::print("{}\n", list.dump(2));
+            PrintJson(list);
         }
     });
 }

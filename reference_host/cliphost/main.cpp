@@ -139,7 +139,7 @@ int Run(int argc, char** argv) {
     } catch (const CLI::ParseError& error) {
         return app.exit(error) == 0 ? kExitFine : kExitCaller;
     } catch (const Failure& failure) {
-        Tell(failure.what());
+        TellProblem(failure.problem(), session.verbosity);
         return failure.status();
     } catch (const std::system_error& error) {
         if (std::ferror(stdout) != 0) {

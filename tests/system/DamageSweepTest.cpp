@@ -53,7 +53,7 @@ protected:
             EXPECT_EQ(Parts(cliphost::ReadTree(description.file.get()), "Mobs").size(), 3u);
             return true;
         }
-        EXPECT_NE(description.problem.find(file.string()), std::string::npos);
+        EXPECT_NE(LineOf(description.problem).find(file.string()), std::string::npos);
         return false;
     }
 

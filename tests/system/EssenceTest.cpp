@@ -170,7 +170,7 @@ TEST_F(EssenceMap, CountsTheTracksThatTheDescriptionHas) {
     for (ncfUInt32 track = 1; track < 4; ++track) {
         EXPECT_EQ(essence.tracks()[track].kind, TrackKind::Sound);
         EXPECT_EQ(essence.tracks()[track].length, 19200u);
-        EXPECT_EQ(essence.Obstacle(essence.tracks()[track]), "");
+        EXPECT_FALSE(essence.Obstacle(essence.tracks()[track]));
         ncfUInt32 channels = 0;
         EXPECT_EQ(essence.map().GetNumberOfChannels(track, &channels), NCF_OK);
         EXPECT_EQ(channels, track == 1 ? 1u : track == 2 ? 2u : 6u);
@@ -189,8 +189,8 @@ TEST_F(EssenceMap, SaysThatTheSoundBehindASecondPictureCantBeDelivered) {
     {
         Essence essence(session(), movie);
         ASSERT_EQ(essence.tracks().size(), 2u);
-        EXPECT_EQ(essence.Obstacle(essence.tracks()[0]), "");
-        EXPECT_NE(essence.Obstacle(essence.tracks()[1]).find("more than one picture track"),
+        EXPECT_FALSE(essence.Obstacle(essence.tracks()[0]));
+        EXPECT_NE(essence.Obstacle(essence.tracks()[1]).reason.find("more than one picture track"),
                   std::string::npos);
     }
     const CommandResult result =

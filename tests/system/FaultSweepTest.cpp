@@ -58,7 +58,7 @@ protected:
             Check(description);
             if (calls < n) {
                 EXPECT_GT(refused, 0) << "nothing was ever refused";
-                EXPECT_TRUE(description.file) << description.problem;
+                EXPECT_TRUE(description.file) << LineOf(description.problem);
                 Report();
                 return;
             }
@@ -72,9 +72,9 @@ protected:
     void Check(const cliphost::Description& description) {
         ASSERT_EQ(description.result >= 0, static_cast<bool>(description.file));
         if (!description.file) {
-            EXPECT_EQ(kDocumented.count(description.result), 1u) << description.problem;
+            EXPECT_EQ(kDocumented.count(description.result), 1u) << LineOf(description.problem);
             EXPECT_TRUE(ModuleIsIdle());
-            EXPECT_NE(description.problem.find(movie_.string()), std::string::npos);
+            EXPECT_NE(LineOf(description.problem).find(movie_.string()), std::string::npos);
         } else {
             // What was refused was not needed: three whole mobs all the same.
             EXPECT_EQ(Parts(cliphost::ReadTree(description.file.get()), "Mobs").size(), 3u);

@@ -74,7 +74,7 @@ TEST_F(Folders, WithAMovieOfAnyNameAreListed) {
         listed.insert(clip.path);
         const auto description =
             cliphost::DescribeFromList(session(), clips.list(), clip.index, clip.path);
-        EXPECT_TRUE(description.file) << clip.path << description.problem;
+        EXPECT_TRUE(description.file) << clip.path << LineOf(description.problem);
     }
     EXPECT_EQ(listed, expected);
 }
@@ -120,7 +120,7 @@ TEST_F(Folders, DescribeAsContainersDo) {
     const cliphost::FolderClips clips(session(), path.get());
     ASSERT_EQ(clips.clips().size(), 1u);
     const auto fromList = cliphost::DescribeFromList(session(), clips.list(), 0, movie);
-    ASSERT_TRUE(fromList.file) << fromList.problem;
+    ASSERT_TRUE(fromList.file) << LineOf(fromList.problem);
     EXPECT_EQ(cliphost::ToReadableText(cliphost::ReadTree(fromList.file.get())),
               cliphost::ToReadableText(Describe(movie)));
 }

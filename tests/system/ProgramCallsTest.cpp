@@ -63,7 +63,8 @@ TEST_F(ProgramCalls, GoOnWithTheOtherMoviesAfterOneThatIsBad) {
     EXPECT_EQ(json.status, 1);
     const Json list = Json::parse(json.out);
     ASSERT_EQ(list.size(), 2u);
-    EXPECT_TRUE(list[0].contains("problem"));
+    EXPECT_EQ(list[0]["reason"], "there is no such file or folder");
+    EXPECT_TRUE(list[0]["code"].is_null());
     EXPECT_TRUE(list[1].contains("description"));
 }
 

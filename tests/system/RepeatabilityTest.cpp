@@ -28,7 +28,7 @@ protected:
     }
     std::filesystem::path Save(const std::filesystem::path& movie, const std::string& name) {
         const auto description = cliphost::DescribeMovie(session(), movie);
-        EXPECT_TRUE(description.file) << description.problem;
+        EXPECT_TRUE(description.file) << LineOf(description.problem);
         if (description.file) {
             session().aaf().Save(description.file.get(), folder() / name);
         }
@@ -98,7 +98,7 @@ TEST_F(Repeatability, TheSavedFileReadsBackAsTheDescription) {
             continue;
         }
         const auto description = cliphost::DescribeMovie(session(), entry.path());
-        ASSERT_TRUE(description.file) << description.problem;
+        ASSERT_TRUE(description.file) << LineOf(description.problem);
         session().aaf().Save(description.file.get(), folder() / "saved.aaf");
         const auto saved = session().aaf().Open(folder() / "saved.aaf");
         EXPECT_EQ(cliphost::ToText(cliphost::ReadTree(description.file.get())),

@@ -50,7 +50,7 @@ void SystemTest::TearDown() {
 
 cliphost::TreeNode SystemTest::Describe(const std::filesystem::path& movie) {
     const cliphost::Description description = cliphost::DescribeMovie(*session_, movie);
-    EXPECT_GE(description.result, 0) << description.problem;
+    EXPECT_GE(description.result, 0) << LineOf(description.problem);
     return description.file ? cliphost::ReadTree(description.file.get()) : cliphost::TreeNode();
 }
 

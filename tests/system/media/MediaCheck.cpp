@@ -233,7 +233,7 @@ MediaVerdict CheckMedia(cliphost::Session& session, const std::filesystem::path&
         verdict.isRight = !defects.empty();
         verdict.summary = verdict.isRight ? "refused: " + Joined(defects) : "refused";
         if (!verdict.isRight) {
-            verdict.differences = {"nothing shows why: " + description.problem};
+            verdict.differences = {"nothing shows why: " + LineOf(description.problem)};
         }
         return verdict;
     }

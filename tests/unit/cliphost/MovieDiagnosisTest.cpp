@@ -24,7 +24,7 @@ std::string Atom(const std::string& type, const std::string& body, std::size_t c
 std::string Diagnosis(const std::string& content) {
     const TestFolder folder;
     WriteFile(folder / "movie.mov", content);
-    return DiagnoseMovie(folder / "movie.mov");
+    return LineOf(DiagnoseMovie(folder / "movie.mov"));
 }
 
 void ExpectSays(const std::string& content, const char* words) {
@@ -38,11 +38,12 @@ const std::string kType = Atom("ftyp", "qt  \0\0\0\0");
 
 TEST(MovieDiagnosis, TellsFilesThatHoldNothing) {
     const TestFolder folder;
-    EXPECT_NE(DiagnoseMovie(folder / "none.mov").find("can't be read"), std::string::npos);
-    EXPECT_NE(DiagnoseMovie(folder.path()).find("this is a folder"), std::string::npos);
+    EXPECT_NE(DiagnoseMovie(folder / "none.mov").reason.find("can't be read"), std::string::npos);
+    EXPECT_NE(DiagnoseMovie(folder.path()).reason.find("this is a folder"), std::string::npos);
     // One that nobody writes to would be waited for without end.
     ASSERT_EQ(mkfifo((folder / "pipe.mov").c_str(), 0600), 0);
-    EXPECT_NE(DiagnoseMovie(folder / "pipe.mov").find("a pipe or device"), std::string::npos);
+    EXPECT_NE(DiagnoseMovie(folder / "pipe.mov").reason.find("a pipe or device"),
+              std::string::npos);
     ExpectSays("", "the file is empty");
 }
 

@@ -1,0 +1,29 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <nlohmann/json.hpp>
+
+#include "reference_host/cliphost/Failure.h"
+
+namespace cliphost {
+
+// Prints what a verb answers to --json on standard output.
+void PrintJson(const nlohmann::ordered_json& answer);
+
+// Does a verb's work. With `json`, a failure of it is told on standard output as
+// well: `head`, which names the movie or folder, and the problem.
+template <class Work>
+void AnswerFailureToo(bool json, nlohmann::ordered_json head, const Work& work) {
+    try {
+        work();
+    } catch (const Failure& failure) {
+        if (json) {
+            AddProblem(failure.problem(), head);
+            PrintJson(head);
+        }
+        throw;
+    }
+}
+
+}  // namespace cliphost
