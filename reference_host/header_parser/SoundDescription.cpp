@@ -6,6 +6,8 @@
 #include <cmath>
 #include <iterator>
 
+#include "reference_host/header_parser/SoundConfig.h"
+
 namespace header_parser {
 
 namespace {
@@ -109,6 +111,25 @@ bool IsMarkedLittleEndian(const ncfUInt8* begin, const ncfUInt8* end) {
     return enda.Size() >= 2 && LoadU16(enda.begin) != 0;
 }
 
+// `ipcm` and `fpcm`: the atom `pcmC` behind the fields tells byte order and depth.
+Verdict DescribeIsoLinear(const RawFields& raw, const Atom& pcmC, SoundDescription& description) {
+    constexpr ncfUInt64 kSize = 6;  // version and flags, byte order, depth
+    const bool isTold = pcmC.Size() >= kSize;
+    const ncfUInt32 bits = isTold ? pcmC.begin[5] : raw.bits;
+    const bool isFloat = description.codec == Code("fpcm");
+    const bool isPossible = bits == 32 || (isFloat ? bits == 64 : bits == 16 || bits == 24);
+    if (raw.channels == 0 || !isPossible) {
+        return Broken("a description of linear sound has impossible values");
+    }
+    description.bits = bits;
+    description.isLinear = true;
+    description.isLittleEndian = isTold && (pcmC.begin[4] & 1) != 0;
+    description.isConstantBitRate = true;
+    description.framesPerPacket = 1;
+    description.bytesPerPacket = description.channels * (bits / 8);
+    return Fine();
+}
+
 Verdict DescribeLinear(const LinearCode& code, const RawFields& raw, bool isLittleEndian,
                        SoundDescription& description) {
     description.bits = code.bits;
@@ -180,6 +201,11 @@ Verdict ReadSoundDescription(const Atom& entry, bool isIso, ncfUInt32 mediaTimeS
         return DescribeLinear(*code, raw, IsMarkedLittleEndian(reader.At(), reader.End()),
                               description);
     }
+    if (entry.type == Code("ipcm") || entry.type == Code("fpcm")) {
+        return DescribeIsoLinear(raw, FindAtom(reader.At(), reader.End(), Code("pcmC")),
+                                 description);
+    }
+    ReadSoundConfig(entry.type, reader.At(), reader.End(), description);
     DescribeCompressed(raw, description);
     return Fine();
 }

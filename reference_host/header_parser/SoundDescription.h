@@ -19,6 +19,15 @@ struct SoundDescription {
     bool isConstantBitRate = false;
     ncfUInt32 bytesPerPacket = 0;  // all channels; 0 when it varies
     ncfUInt32 framesPerPacket = 1;
+    // What the header leaves open of channels and rate.
+    enum class Open {
+        kNothing,
+        kMpegAudio,  // the first packet's own header tells both
+        kAac,        // the first packet tells whether what it holds is extended
+    } open = Open::kNothing;
+    // The decoder's configuration, in the bytes of the header.
+    const ncfUInt8* configBegin = nullptr;
+    const ncfUInt8* configEnd = nullptr;
 
     // How samples lie whose table says that each has one byte.
     PacketLayout OldLayout() const { return {framesPerPacket, bytesPerPacket}; }
@@ -26,7 +35,8 @@ struct SoundDescription {
 
 // `entry` is the description behind its size and code; `isIso` tells that the
 // list is of the ISO form, where version 1 adds no fields. A description
-// without a rate has that of the media.
+// without a rate has that of the media. Channels and rate of compressed sound
+// are those that come out of its decoder.
 Verdict ReadSoundDescription(const Atom& entry, bool isIso, ncfUInt32 mediaTimeScale,
                              SoundDescription& description);
 

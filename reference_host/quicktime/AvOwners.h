@@ -7,6 +7,7 @@
 extern "C" {
 #include <libavcodec/avcodec.h>
 #include <libavformat/avformat.h>
+#include <libswresample/swresample.h>
 #include <libswscale/swscale.h>
 }
 
@@ -33,6 +34,16 @@ struct FreePacket {
     void operator()(AVPacket* packet) const { av_packet_free(&packet); }
 };
 using PacketOwner = std::unique_ptr<AVPacket, FreePacket>;
+
+struct FreeParser {
+    void operator()(AVCodecParserContext* parser) const { av_parser_close(parser); }
+};
+using ParserOwner = std::unique_ptr<AVCodecParserContext, FreeParser>;
+
+struct FreeResampler {
+    void operator()(SwrContext* resampler) const { swr_free(&resampler); }
+};
+using ResamplerOwner = std::unique_ptr<SwrContext, FreeResampler>;
 
 struct FreeScaler {
     void operator()(SwsContext* scaler) const { sws_freeContext(scaler); }

@@ -99,7 +99,10 @@ private:
                 ReadTrackHeader(position, end);
                 return;
             case Code("stsd"):
-                ReadDescriptions(position, end);
+                ReadDescriptions(position, end, depth);
+                return;
+            case Code("pcmC"):
+                ReadLinearKind(position, end);
                 return;
             case Code("elst"):
                 ReadEdits(position, end);
@@ -166,7 +169,7 @@ private:
         out_.tracks.back().edits = std::move(edits);
     }
 
-    void ReadDescriptions(ncfUInt64 position, ncfUInt64 end) {
+    void ReadDescriptions(ncfUInt64 position, ncfUInt64 end, int depth) {
         ncfUInt8 bytes[8];
         if (!out_.tracks.empty() && end - position >= 8 && Read(position, bytes, sizeof bytes)) {
             // No description is shorter than its own head.
@@ -174,6 +177,30 @@ private:
             const ncfUInt64 count = Number(bytes + 4, 4);
             out_.tracks.back().descriptionCount =
                 static_cast<ncfUInt32>(count < most ? count : most);
+            ReadFirstDescription(position + 8, end, depth);
+        }
+    }
+
+    // Of the one kind of sound whose form stands in an atom behind the fields.
+    void ReadFirstDescription(ncfUInt64 position, ncfUInt64 end, int depth) {
+        constexpr ncfUInt64 kFields = 36;
+        ncfUInt8 bytes[8];
+        if (end - position < kFields || !Read(position, bytes, sizeof bytes)) {
+            return;
+        }
+        const ncfUInt64 size = Number(bytes, 4);
+        const ncfUInt64 code = Number(bytes + 4, 4);
+        const bool isLinear = code == Code("ipcm") || code == Code("fpcm");
+        if (isLinear && size >= kFields && size <= end - position) {
+            Descend(position + kFields, position + size, depth);
+        }
+    }
+
+    void ReadLinearKind(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[6];
+        if (!out_.tracks.empty() && end - position >= 6 && Read(position, bytes, sizeof bytes)) {
+            out_.tracks.back().isLittleEndian = (bytes[4] & 1) != 0;
+            out_.tracks.back().linearBits = bytes[5];
         }
     }
 

@@ -24,6 +24,10 @@ struct MovieAtoms {
         // Samples, from 0, that have another description than the one before.
         std::vector<ncfUInt64> descriptionChanges;
         bool needsOtherFiles = false;
+        // Of linear sound whose first description has an atom `pcmC`: bits of a
+        // number, 0 for none, and whether its low byte comes first.
+        ncfUInt32 linearBits = 0;
+        bool isLittleEndian = false;
         std::vector<Edit> edits;  // none where some do not play as fast as the media
     };
     ncfUInt32 timeScale = 0;  // 0: no movie header was found

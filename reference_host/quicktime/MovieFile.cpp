@@ -231,6 +231,19 @@ const AVStream* MovieFile::FindDetailedTrack(ncfUInt32 track) {
     return FindTrack(track);
 }
 
+const SoundForm* MovieFile::SoundFormOf(ncfUInt32 track) {
+    const int stream = StreamOf(track);
+    if (stream < 0) {
+        return nullptr;
+    }
+    const auto [entry, isNew] = soundForms_.try_emplace(stream);
+    SoundForm form;
+    if (isNew && ReadSoundForm(path_, *input_->streams[stream], form)) {
+        entry->second = form;
+    }
+    return entry->second ? &*entry->second : nullptr;
+}
+
 AVFieldOrder MovieFile::ContainerFieldOrder(ncfUInt32 track) const {
     const int stream = StreamOf(track);
     return stream < 0 || stream >= static_cast<int>(told_.size())

@@ -12,6 +12,7 @@
 #include "host_interfaces/framework/Types.h"
 #include "reference_host/quicktime/AvOwners.h"
 #include "reference_host/quicktime/MovieAtoms.h"
+#include "reference_host/quicktime/SoundForm.h"
 
 namespace host {
 
@@ -61,6 +62,8 @@ public:
         AVRational pixelAspect{0, 1};
     };
     Raster RasterOf(ncfUInt32 track);
+    // The form in which a track's sound is delivered; null when it is no sound.
+    const SoundForm* SoundFormOf(ncfUInt32 track);
     // Pictures a second of the first picture track, 0.0 when nothing tells.
     double PictureRate();
 
@@ -98,6 +101,7 @@ private:
     ncfUInt64 counted_ = 0;  // pictures found so far
     bool countedAll_ = false;
     std::map<int, double> secondsOfPackets_;
+    std::map<int, std::optional<SoundForm>> soundForms_;
 };
 
 }  // namespace host

@@ -10,7 +10,10 @@ extern "C" {
 #include <cerrno>
 #include <cstdio>
 #include <fstream>
+#include <optional>
 #include <string_view>
+
+#include "reference_host/quicktime/MovieAtoms.h"
 
 namespace host {
 namespace {
@@ -102,6 +105,31 @@ bool AreStreamsKnown(const AVFormatContext& input) {
     return input.nb_streams > 0;
 }
 
+// The library knows whole numbers of this form of linear sound, `ipcm`, but no
+// floating-point ones.
+void NameFloatSound(AVFormatContext& input, const std::filesystem::path& path) {
+    constexpr unsigned kFloatTag = MKTAG('f', 'p', 'c', 'm');
+    std::optional<MovieAtoms> atoms;
+    for (unsigned i = 0; i < input.nb_streams; ++i) {
+        AVCodecParameters& form = *input.streams[i]->codecpar;
+        if (form.codec_tag != kFloatTag || form.codec_id != AV_CODEC_ID_NONE) {
+            continue;
+        }
+        if (!atoms) {
+            atoms = ReadMovieAtoms(path);
+        }
+        const auto* const track = atoms->Find(static_cast<ncfUInt32>(input.streams[i]->id));
+        const ncfUInt32 bits = track && track->linearBits != 0
+                                   ? track->linearBits
+                                   : static_cast<ncfUInt32>(form.bits_per_coded_sample);
+        const bool isLittle = track && track->isLittleEndian;
+        form.codec_id = bits == 32   ? isLittle ? AV_CODEC_ID_PCM_F32LE : AV_CODEC_ID_PCM_F32BE
+                        : bits == 64 ? isLittle ? AV_CODEC_ID_PCM_F64LE : AV_CODEC_ID_PCM_F64BE
+                                     : AV_CODEC_ID_NONE;
+        form.bits_per_coded_sample = static_cast<int>(bits);
+    }
+}
+
 }  // namespace
 
 void CloseInput::operator()(AVFormatContext* context) const {
@@ -133,6 +161,9 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
         return nullptr;
     }
     InputOwner input(opened);
+    if (IsMovieFamily(*input)) {
+        NameFloatSound(*input, path);
+    }
     if (!AreStreamsKnown(*input)) {
         FindStreamDetails(*input);
     }

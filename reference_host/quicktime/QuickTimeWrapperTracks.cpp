@@ -125,8 +125,13 @@ NCFRESULT QuickTimeWrapper::GetAudioInfoForTrack(ncfUInt32 track, ncfUInt32* cha
         return NCF_E_NOTFOUND;
     }
     SoundForm form;
-    if (!ReadSoundForm(*stream, form)) {
-        return NCF_E_FAIL;
+    const NCFRESULT found = Guarded([&] {
+        const SoundForm* const known = movie_->SoundFormOf(track);
+        form = known ? *known : form;
+        return known ? NCF_OK : NCF_E_FAIL;
+    });
+    if (found < 0) {
+        return found;
     }
     Give(channels, form.channels);
     Give(sampleRate, form.sampleRate);

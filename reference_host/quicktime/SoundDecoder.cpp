@@ -32,25 +32,13 @@ bool LeansOnAllBefore(AVCodecID codec) {
     }
 }
 
-// Of two decoders the one that gives the same sound from wherever it starts: the
-// other carries what it rounds off from sample to sample.
-const AVCodec* DecoderFor(AVCodecID codec) {
-    const char* const name = codec == AV_CODEC_ID_MP2   ? "mp2float"
-                             : codec == AV_CODEC_ID_MP1 ? "mp1float"
-                                                        : nullptr;
-    const AVCodec* const even = name ? avcodec_find_decoder_by_name(name) : nullptr;
-    return even ? even : avcodec_find_decoder(codec);
-}
-
 // Damaged files have times that no sum must be made of.
 ncfSInt64 Rescaled(ncfSInt64 value, AVRational from, AVRational to) {
     return std::clamp(av_rescale_q(value, from, to), -kFarthestTime, kFarthestTime);
 }
 
-bool IsLinear(const AVCodecParameters& form) {
-    return av_get_exact_bits_per_sample(form.codec_id) > 0 &&
-           std::string_view(avcodec_get_name(form.codec_id)).substr(0, 4) == "pcm_";
-}
+// What a conversion of the rate may hold back.
+constexpr ncfSInt64 kConversionFrames = 64;
 
 }  // namespace
 
@@ -65,59 +53,64 @@ std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& pa
         FindStreamDetails(*input);  // tells where the file starts
     }
     const AVStream& of = *input->streams[stream];
-    const AVCodec* const decoder = DecoderFor(of.codecpar->codec_id);
-    CodecOwner codec(decoder ? avcodec_alloc_context3(decoder) : nullptr);
-    if (!codec || avcodec_parameters_to_context(codec.get(), of.codecpar) < 0) {
-        return nullptr;
-    }
-    codec->pkt_timebase = of.time_base;
+    auto codec = SoundCodec::Open(of, false);
     SoundForm form;
-    if (!ReadSoundForm(of, form) || avcodec_open2(codec.get(), decoder, nullptr) < 0) {
+    if (!codec || !ReadSoundForm(path, of, form)) {
         return nullptr;
     }
     UseOneStream(*input, stream);
-    return std::unique_ptr<SoundDecoder>(
-        new SoundDecoder(path, std::move(input), std::move(codec), stream, hasWholeIndex, view));
+    return std::unique_ptr<SoundDecoder>(new SoundDecoder(
+        {path, view, stream, hasWholeIndex, std::move(input), std::move(codec), form}));
 }
 
-SoundDecoder::SoundDecoder(std::filesystem::path path, InputOwner input, CodecOwner codec,
-                           int stream, bool hasWholeIndex, InputView view)
-    : path_(std::move(path)),
-      view_(view),
-      input_(std::move(input)),
-      codec_(std::move(codec)),
+SoundDecoder::SoundDecoder(Opened opened)
+    : path_(std::move(opened.path)),
+      view_(opened.view),
+      input_(std::move(opened.input)),
+      codec_(std::move(opened.codec)),
       frame_(av_frame_alloc()),
       packet_(av_packet_alloc()),
-      stream_(stream),
-      channels_(input_->streams[stream]->codecpar->ch_layout.nb_channels) {
+      stream_(opened.stream),
+      channels_(static_cast<int>(opened.form.channels)),
+      rate_(static_cast<int>(opened.form.sampleRate)),
+      isLinear_(opened.form.bitsPerChannel > 0),
+      converter_(channels_, rate_) {
     const AVStream& of = *input_->streams[stream_];
-    const ncfSInt64 start = hasWholeIndex ? AV_NOPTS_VALUE : UsableTime(input_->start_time);
+    const ncfSInt64 start = opened.hasWholeIndex ? AV_NOPTS_VALUE : UsableTime(input_->start_time);
     // Before 0 a movie has what primes its decoders.
     if (start != AV_NOPTS_VALUE && (start > 0 || !IsMovieFamily(*input_))) {
         zeroTime_ = Rescaled(start, AVRational{1, AV_TIME_BASE}, of.time_base);
     }
-    const int rate = of.codecpar->sample_rate;
-    tolerance_ = 1 + 2 * av_rescale_rnd(rate, of.time_base.num, of.time_base.den, AV_ROUND_UP);
-    if (of.time_base.num == 1 && of.time_base.den == rate) {
+    tolerance_ = 1 + 2 * av_rescale_rnd(rate_, of.time_base.num, of.time_base.den, AV_ROUND_UP);
+    const int coarser = av_cmp_q(of.time_base, AVRational{1, rate_});
+    if (coarser == 0) {
         tolerance_ = 0;
     }
-    countsPlaces_ = av_cmp_q(of.time_base, AVRational{1, rate}) > 0;
+    framesPerPacket_ = opened.form.decodedPerPacket;
+    const bool isRounded = coarser != 0 && IsMovieFamily(*input_) && !isLinear_;
+    if (isRounded && opened.hasWholeIndex && framesPerPacket_ > 0) {
+        places_.emplace(of, framesPerPacket_, rate_, zeroTime_);
+        if (places_->IsEmpty()) {
+            places_.reset();
+        }
+    }
+    countsPlaces_ = !places_ && (coarser > 0 || isRounded);
     leansOnAll_ = LeansOnAllBefore(of.codecpar->codec_id) || !TellsTimesOfAll(*input_);
 }
 
 ncfSInt64 SoundDecoder::TimeOf(ncfSInt64 place) const {
     const AVStream& of = *input_->streams[stream_];
-    return zeroTime_ + Rescaled(place, AVRational{1, of.codecpar->sample_rate}, of.time_base);
+    return zeroTime_ + Rescaled(place, AVRational{1, rate_}, of.time_base);
 }
 
 ncfSInt64 SoundDecoder::PlaceOf(ncfSInt64 time) const {
     const AVStream& of = *input_->streams[stream_];
-    return Rescaled(time - zeroTime_, of.time_base, AVRational{1, of.codecpar->sample_rate});
+    return Rescaled(time - zeroTime_, of.time_base, AVRational{1, rate_});
 }
 
 ncfSInt64 SoundDecoder::Preroll() const {
     const AVCodecParameters& form = *input_->streams[stream_]->codecpar;
-    return IsLinear(form) ? 0 : std::max<ncfSInt64>(kPrerollFrames, form.seek_preroll);
+    return isLinear_ ? 0 : std::max<ncfSInt64>(kPrerollFrames, form.seek_preroll);
 }
 
 void SoundDecoder::Rewind() {
@@ -127,12 +120,17 @@ void SoundDecoder::Rewind() {
     if (isRunning_) {
         input_ = std::move(again);
         UseOneStream(*input_, stream_);
+        // What a decoder carries on does not go with a flush.
+        if (auto codec = SoundCodec::Open(*input_->streams[stream_], false)) {
+            codec_ = std::move(codec);
+        }
     }
 }
 
 bool SoundDecoder::SeekByTime(ncfSInt64 place) {
     // What primes a decoder has times below zero.
-    const ncfSInt64 from = TimeOf(place - Preroll());
+    const ncfSInt64 early = place - Preroll();
+    const ncfSInt64 from = places_ ? places_->TimeOf(early) : TimeOf(early);
     return av_seek_frame(input_.get(), stream_, from, AVSEEK_FLAG_BACKWARD) >= 0 ||
            av_seek_frame(input_.get(), stream_, std::max(from, zeroTime_), AVSEEK_FLAG_BACKWARD) >=
                0 ||
@@ -149,9 +147,16 @@ bool SoundDecoder::SeekToKnown(ncfSInt64 place) {
 }
 
 void SoundDecoder::Start(ncfSInt64 place) {
-    avcodec_flush_buffers(codec_.get());
+    codec_->Flush();
+    converter_.Forget();
     isRunning_ = true;
+    isFed_ = false;
+    isHeld_ = false;
+    mustRestart_ = false;
     isPlaced_ = false;
+    lastTime_ = AV_NOPTS_VALUE;
+    framesSince_ = 0;
+    lastMapped_.reset();
     blockStart_ = 0;
     blockCount_ = 0;
     if (leansOnAll_ || (countsPlaces_ && !SeekToKnown(place))) {
@@ -177,45 +182,119 @@ bool SoundDecoder::MayDecodeOnTo(ncfSInt64 place) const {
     return countsPlaces_ && known_.back().place <= reached + kNearFrames;
 }
 
+// Gives the decoder the next packet, and at last the end; false behind that.
 bool SoundDecoder::Feed() {
-    while (av_read_frame(input_.get(), packet_.get()) >= 0) {
+    while (!isFed_ && av_read_frame(input_.get(), packet_.get()) >= 0) {
         const bool isOurs = packet_->stream_index == stream_;
         if (isOurs) {
-            avcodec_send_packet(codec_.get(), packet_.get());  // a refused one leaves a gap
+            codec_->Send(packet_.get());
         }
         av_packet_unref(packet_.get());
         if (isOurs) {
             return true;
         }
     }
-    return avcodec_send_packet(codec_.get(), nullptr) >= 0;
+    const bool isEnd = !isFed_;
+    if (isEnd) {
+        codec_->Send(nullptr);
+    }
+    isFed_ = true;
+    return isEnd;
+}
+
+// The next frame out of the decoder; false when there is none.
+bool SoundDecoder::Receive() {
+    for (;;) {
+        const int got = codec_->Receive(*frame_);
+        if (got >= 0) {
+            return true;
+        }
+        if (got == AVERROR_EOF || (got == AVERROR(EAGAIN) && !Feed())) {
+            return false;
+        }
+    }
+}
+
+// From now on, since what is decoded after a jump is not what it was.
+void SoundDecoder::DecodeFromStartAlways() {
+    leansOnAll_ = true;
+    mustRestart_ = !isFromStart_;
 }
 
 bool SoundDecoder::Advance() {
     for (;;) {
-        const int got = avcodec_receive_frame(codec_.get(), frame_.get());
-        if (got == AVERROR(EAGAIN)) {
-            if (Feed()) {
-                continue;
-            }
-            isRunning_ = false;
-            return false;
-        }
-        if (got == AVERROR_EOF) {
-            isRunning_ = false;
-            return false;
-        }
-        if (got < 0) {
-            continue;
-        }
         block_.clear();
-        if (!AppendSoundWords(*frame_, channels_, block_)) {
+        if (!isHeld_) {
+            const bool hasFrame = Receive();
+            isRunning_ = hasFrame;
+            isHeld_ = hasFrame && converter_.HasRestBefore(*frame_);
+            if (!hasFrame || isHeld_) {
+                converter_.AppendRest(block_);
+                if (!block_.empty()) {
+                    PlaceRest();
+                    return true;
+                }
+            }
+            if (!hasFrame) {
+                return false;
+            }
+        }
+        isHeld_ = false;
+        if (!converter_.Append(*frame_, block_)) {
             continue;
+        }
+        if (IsConverting() && !leansOnAll_) {
+            DecodeFromStartAlways();
+        }
+        if (IsConverting() && places_) {
+            places_.reset();
+            countsPlaces_ = true;
+        }
+        if (mustRestart_) {
+            return false;
         }
         if (PlaceBlock()) {
             return true;
         }
+        if (mustRestart_) {
+            return false;
+        }
     }
+}
+
+bool SoundDecoder::IsConverting() const {
+    return frame_->sample_rate != rate_;
+}
+
+// What the conversion of a rate held back follows what it gave.
+void SoundDecoder::PlaceRest() {
+    blockStart_ += blockCount_;
+    blockCount_ = static_cast<ncfSInt64>(block_.size()) / channels_;
+    framesSince_ += blockCount_;
+}
+
+// The place that the index gives the block; nothing where it does not know it,
+// or turns out to be wrong about how much packets hold.
+std::optional<ncfSInt64> SoundDecoder::PlaceByMap() {
+    const std::optional<ncfSInt64> packet = places_->Of(frame_->pkt_dts);
+    if (!packet) {
+        return std::nullopt;
+    }
+    // Priming is cut from a packet's start, and the frame's time tells how much.
+    const AVStream& of = *input_->streams[stream_];
+    const ncfSInt64 time = UsableTime(frame_->best_effort_timestamp);
+    const ncfSInt64 cut = time == AV_NOPTS_VALUE ? 0
+                                                 : Rescaled(time - frame_->pkt_dts, of.time_base,
+                                                            AVRational{1, rate_});
+    const bool follows = lastMapped_ && *packet == *lastMapped_ + framesPerPacket_;
+    if (follows && cut == 0 && *packet != blockStart_ + blockCount_) {
+        places_.reset();
+        countsPlaces_ = true;
+        DecodeFromStartAlways();
+        return std::nullopt;
+    }
+    lastMapped_ = *packet;
+    return *packet + cut;
 }
 
 // Finds the place of the block that was decoded; false for one that can't be
@@ -224,7 +303,13 @@ bool SoundDecoder::PlaceBlock() {
     const ncfSInt64 follows = blockStart_ + blockCount_;
     const ncfSInt64 time = UsableTime(frame_->best_effort_timestamp);
     ncfSInt64 start = time == AV_NOPTS_VALUE ? follows : PlaceOf(time);
-    if (countsPlaces_ && !isPlaced_ && !isFromStart_) {
+    const std::optional<ncfSInt64> mapped = places_ ? PlaceByMap() : std::nullopt;
+    if (mustRestart_) {
+        return false;
+    }
+    if (mapped) {
+        start = *mapped;
+    } else if (countsPlaces_ && !isPlaced_ && !isFromStart_) {
         const auto found = std::lower_bound(
             known_.begin(), known_.end(), time,
             [](const KnownBlock& block, ncfSInt64 wanted) { return block.time < wanted; });
@@ -232,12 +317,24 @@ bool SoundDecoder::PlaceBlock() {
             return false;
         }
         start = found->place;
-    } else if (isPlaced_ && std::abs(start - follows) <= tolerance_) {
+    } else if (isPlaced_ && (IsConverting() || time == AV_NOPTS_VALUE)) {
         start = follows;
+    } else if (isPlaced_ && countsPlaces_ && lastTime_ != AV_NOPTS_VALUE) {
+        const AVStream& of = *input_->streams[stream_];
+        start = follows + GapOfStep(time - lastTime_, framesSince_, of.time_base, rate_);
+    } else if (isPlaced_) {
+        const ncfSInt64 most =
+            converter_.HasConvertedRate() ? std::max(tolerance_, kConversionFrames) : tolerance_;
+        start = std::abs(start - follows) <= most ? follows : start;
     }
     isPlaced_ = true;
     blockStart_ = start;
-    blockCount_ = frame_->nb_samples;
+    blockCount_ = static_cast<ncfSInt64>(block_.size()) / channels_;
+    if (time != AV_NOPTS_VALUE) {
+        lastTime_ = time;
+        framesSince_ = 0;
+    }
+    framesSince_ += blockCount_;
     if (countsPlaces_ && time != AV_NOPTS_VALUE &&
         (known_.empty() || (time > known_.back().time && start > known_.back().place))) {
         known_.push_back({time, start});
@@ -271,9 +368,15 @@ ncfUInt64 SoundDecoder::Read(ncfUInt64 place, ncfUInt64 count, std::vector<ncfSI
         } else if (blockCount_ > 0 && blockStart_ >= end) {
             reached = end;  // silence before sound that is still to come
         }
-        if (reached >= end || !isRunning_ || !Advance()) {
+        if (reached < end && isRunning_ && Advance()) {
+            continue;
+        }
+        if (!mustRestart_) {
             return static_cast<ncfUInt64>(reached - first);
         }
+        Start(first);
+        words.assign(words.size(), 0);
+        reached = first;
     }
 }
 

@@ -4,16 +4,22 @@
 
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <vector>
 
 #include "host_interfaces/framework/ResultCodes.h"
 #include "reference_host/quicktime/AvOwners.h"
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/SoundCodec.h"
+#include "reference_host/quicktime/SoundConverter.h"
+#include "reference_host/quicktime/SoundForm.h"
+#include "reference_host/quicktime/SoundPlaces.h"
 
 namespace host {
 
 // Decodes one sound track by place: 0 is the first sample that the movie
-// presents, and what an edit leaves empty is silence. Nothing is resampled.
+// presents, and what an edit leaves empty is silence. Channels and rate are
+// those of the first packets; what changes on the way is brought to them.
 class SoundDecoder {
 public:
     // `hasWholeIndex`: the file is a movie whose own time begins at 0. Other
@@ -23,7 +29,7 @@ public:
                                               InputView view = InputView::AsPresented);
 
     int Channels() const { return channels_; }
-    int SampleRate() const { return input_->streams[stream_]->codecpar->sample_rate; }
+    int SampleRate() const { return rate_; }
     double SecondsOfTimeUnit() const { return av_q2d(input_->streams[stream_]->time_base); }
 
     // `count` frames from `place`, all channels; `words` holds zeros where there
@@ -31,8 +37,16 @@ public:
     ncfUInt64 Read(ncfUInt64 place, ncfUInt64 count, std::vector<ncfSInt32>& words);
 
 private:
-    SoundDecoder(std::filesystem::path path, InputOwner input, CodecOwner codec, int stream,
-                 bool hasWholeIndex, InputView view);
+    struct Opened {
+        std::filesystem::path path;
+        InputView view;
+        int stream;
+        bool hasWholeIndex;
+        InputOwner input;
+        std::unique_ptr<SoundCodec> codec;
+        SoundForm form;
+    };
+    explicit SoundDecoder(Opened opened);
 
     // A block whose place is known because all before it were counted.
     struct KnownBlock {
@@ -49,24 +63,38 @@ private:
     bool MayDecodeOnTo(ncfSInt64 place) const;
     ncfSInt64 Preroll() const;
     bool Advance();  // the next decoded block; false at the end
+    bool Receive();
     bool PlaceBlock();
+    void PlaceRest();
+    std::optional<ncfSInt64> PlaceByMap();
+    bool IsConverting() const;
     bool Feed();
+    void DecodeFromStartAlways();
 
     std::filesystem::path path_;
     InputView view_;
     InputOwner input_;
-    CodecOwner codec_;
+    std::unique_ptr<SoundCodec> codec_;
     FrameOwner frame_;
     PacketOwner packet_;
     int stream_;
     int channels_;
+    int rate_;
+    bool isLinear_;
+    SoundConverter converter_;
     ncfSInt64 zeroTime_ = 0;   // of place 0, in time units of the stream
     ncfSInt64 tolerance_ = 1;  // frames that rounding of times may take
-    // Times are coarser than frames: places are counted, not taken from times.
+    // How places are found where times do not give them to the frame: from the
+    // index where all packets hold equally much, else by counting.
+    std::optional<SoundPlaces> places_;
+    ncfSInt64 framesPerPacket_ = 0;
     bool countsPlaces_ = false;
     bool leansOnAll_ = false;        // a block comes out right only after all before it
     std::vector<KnownBlock> known_;  // of those that are counted, in order
     bool isRunning_ = false;
+    bool isFed_ = false;        // the end was given to the decoder
+    bool isHeld_ = false;       // the frame waits for the rest before it
+    bool mustRestart_ = false;  // what was decoded can't stand
 
     // The block decoded last.
     std::vector<ncfSInt32> block_;
@@ -74,6 +102,10 @@ private:
     ncfSInt64 blockCount_ = 0;
     bool isFromStart_ = false;  // decoding began with the first block
     bool isPlaced_ = false;     // the next block follows the last where times agree
+    // The last block that had a time, and the frames since its start.
+    ncfSInt64 lastTime_ = AV_NOPTS_VALUE;
+    ncfSInt64 framesSince_ = 0;
+    std::optional<ncfSInt64> lastMapped_;  // place of the last packet in the map
 };
 
 }  // namespace host

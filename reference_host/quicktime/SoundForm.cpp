@@ -10,6 +10,8 @@ extern "C" {
 
 #include <string_view>
 
+#include "reference_host/quicktime/DecodedSound.h"
+
 namespace host {
 namespace {
 
@@ -134,6 +136,23 @@ bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
         form.bytesPerPacket = ConstantPacketSize(parameters);
         form.framesPerPacket =
             parameters.frame_size > 0 ? static_cast<ncfUInt32>(parameters.frame_size) : 0;
+    }
+    out = form;
+    return true;
+}
+
+bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, SoundForm& out) {
+    SoundForm form;
+    if (!ReadSoundForm(stream, form)) {
+        return false;
+    }
+    if (form.bitsPerChannel == 0) {
+        const DecodedSound decoded = DecodeFirstSound(path, stream.index);
+        if (decoded.channels > 0 && decoded.channels <= kMostChannels && decoded.rate > 0) {
+            form.channels = static_cast<ncfUInt32>(decoded.channels);
+            form.sampleRate = decoded.rate;
+            form.decodedPerPacket = decoded.framesPerPacket;
+        }
     }
     out = form;
     return true;

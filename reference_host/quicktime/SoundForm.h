@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <filesystem>
+
 #include "host_interfaces/framework/Types.h"
 #include "reference_host/quicktime/AvOwners.h"
 
@@ -16,12 +18,18 @@ struct SoundForm {
     ncfUInt32 bytesPerPacket = 0;   // linear: a frame of all channels; 0: it varies
     ncfUInt32 framesPerPacket = 0;  // 0: it varies
     ncfUInt32 bitsPerChannel = 0;   // 0 for compressed sound
+    int decodedPerPacket = 0;       // frames that come out of each; 0: it varies
     bool isBigEndian = false;
     bool isConstantBitRate = false;
     bool isStoredPlain = false;  // linear, and the file holds frame after frame
 };
 
-// false when the stream is no sound, or its numbers make no sense.
+// As the container tells it; false when the stream is no sound, or its numbers
+// make no sense.
 bool ReadSoundForm(const AVStream& stream, SoundForm& out);
+
+// As it is delivered: channels and rate of compressed sound are those that come
+// out of its decoder.
+bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, SoundForm& out);
 
 }  // namespace host

@@ -1,0 +1,113 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/quicktime/SoundCodec.h"
+
+#include <cstring>
+
+namespace host {
+namespace {
+
+// Of two decoders the one that gives the same sound from wherever it starts: the
+// other carries what it rounds off from sample to sample.
+const AVCodec* DecoderFor(AVCodecID codec) {
+    const char* const name = codec == AV_CODEC_ID_MP2   ? "mp2float"
+                             : codec == AV_CODEC_ID_MP1 ? "mp1float"
+                                                        : nullptr;
+    const AVCodec* const even = name ? avcodec_find_decoder_by_name(name) : nullptr;
+    return even ? even : avcodec_find_decoder(codec);
+}
+
+// Movies put several blocks of these into a sample; the demuxer leaves them so.
+bool NeedsDivision(AVCodecID codec) {
+    return codec == AV_CODEC_ID_AMR_NB || codec == AV_CODEC_ID_AMR_WB;
+}
+
+}  // namespace
+
+std::unique_ptr<SoundCodec> SoundCodec::Open(const AVStream& stream, bool keepsPriming) {
+    const AVCodec* const decoder = DecoderFor(stream.codecpar->codec_id);
+    CodecOwner codec(decoder ? avcodec_alloc_context3(decoder) : nullptr);
+    if (!codec || avcodec_parameters_to_context(codec.get(), stream.codecpar) < 0) {
+        return nullptr;
+    }
+    codec->pkt_timebase = stream.time_base;
+    if (keepsPriming) {
+        codec->flags2 |= AV_CODEC_FLAG2_SKIP_MANUAL;
+    }
+    if (avcodec_open2(codec.get(), decoder, nullptr) < 0) {
+        return nullptr;
+    }
+    std::unique_ptr<SoundCodec> opened(new SoundCodec(std::move(codec)));
+    if (NeedsDivision(stream.codecpar->codec_id)) {
+        opened->parser_.reset(av_parser_init(stream.codecpar->codec_id));
+    }
+    return opened;
+}
+
+// The first part keeps the packet's time; the others follow it.
+void SoundCodec::Divide(const AVPacket& packet) {
+    const ncfUInt8* at = packet.data;
+    int left = packet.size;
+    bool isFirst = true;
+    while (left > 0) {
+        ncfUInt8* part = nullptr;
+        int size = 0;
+        const int used = av_parser_parse2(parser_.get(), codec_.get(), &part, &size, at, left,
+                                          packet.pts, packet.dts, packet.pos);
+        if (used < 0 || (used == 0 && size == 0)) {
+            return;
+        }
+        at += used;
+        left -= used;
+        PacketOwner owned(size > 0 ? av_packet_alloc() : nullptr);
+        if (!owned || av_new_packet(owned.get(), size) < 0) {
+            continue;
+        }
+        std::memcpy(owned->data, part, static_cast<std::size_t>(size));
+        if (isFirst) {
+            av_packet_copy_props(owned.get(), &packet);
+        }
+        isFirst = false;
+        parts_.push_back(std::move(owned));
+    }
+}
+
+void SoundCodec::Send(const AVPacket* packet) {
+    if (!parser_) {
+        avcodec_send_packet(codec_.get(), packet);
+    } else if (packet) {
+        Divide(*packet);
+    } else {
+        isEnding_ = true;
+    }
+}
+
+int SoundCodec::Receive(AVFrame& frame) {
+    for (;;) {
+        const int got = avcodec_receive_frame(codec_.get(), &frame);
+        if (got != AVERROR(EAGAIN)) {
+            return got;
+        }
+        if (!parts_.empty()) {
+            avcodec_send_packet(codec_.get(), parts_.front().get());
+            parts_.pop_front();
+        } else if (isEnding_) {
+            isEnding_ = false;
+            avcodec_send_packet(codec_.get(), nullptr);
+        } else {
+            return got;
+        }
+    }
+}
+
+void SoundCodec::Flush() {
+    avcodec_flush_buffers(codec_.get());
+    parts_.clear();
+    isEnding_ = false;
+    if (parser_) {
+        parser_.reset(av_parser_init(codec_->codec_id));
+    }
+}
+
+}  // namespace host

@@ -1,0 +1,38 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <deque>
+#include <memory>
+
+#include "host_interfaces/framework/Types.h"
+#include "reference_host/quicktime/AvOwners.h"
+
+namespace host {
+
+// A decoder of one sound stream, behind a parser where packets hold several
+// blocks of which the decoder would see the first alone.
+class SoundCodec {
+public:
+    // Null where there is no decoder. `keepsPriming`: what the container says is
+    // to be left out of the first and last packets comes out too.
+    static std::unique_ptr<SoundCodec> Open(const AVStream& stream, bool keepsPriming);
+
+    // Takes a packet, or the end for null; what can't be decoded leaves a gap.
+    void Send(const AVPacket* packet);
+    // As avcodec_receive_frame.
+    int Receive(AVFrame& frame);
+    // Forgets all packets, for a jump.
+    void Flush();
+
+private:
+    explicit SoundCodec(CodecOwner codec) : codec_(std::move(codec)) {}
+    void Divide(const AVPacket& packet);
+
+    CodecOwner codec_;
+    ParserOwner parser_;             // null for most
+    std::deque<PacketOwner> parts_;  // of the last packet, not yet decoded
+    bool isEnding_ = false;
+};
+
+}  // namespace host

@@ -1,0 +1,343 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// Sound whose container tells less, or something else, than comes out of its
+// decoder: what is described, what is offered and what is delivered agree.
+
+#include <algorithm>
+#include <cmath>
+#include <random>
+
+#include "reference_host/cliphost/SoundReader.h"
+#include "tests/system/EssenceSupport.h"
+#include "tests/system/Facts.h"
+#include "tests/system/SoundMovies.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using cliphost::Essence;
+using cliphost::SoundReader;
+using movies::Bytes;
+
+class SoundForms : public SystemTest {
+protected:
+    std::filesystem::path Make(const std::string& arguments, const std::string& name) {
+        const auto path = folder() / name;
+        EXPECT_EQ(
+            RunCommand("ffmpeg -nostdin -v error -y " + arguments + " " + Quoted(path)).status, 0)
+            << arguments;
+        return path;
+    }
+    std::filesystem::path WriteSound(const movies::Track& track, const std::string& name) {
+        movies::Movie movie;
+        movie.timeScale = 44100;
+        movie.tracks = {track};
+        return Write(movie, name);
+    }
+    // What the description says: channels, rate, frames.
+    struct Said {
+        std::string channels, rate, length;
+    };
+    Said Described(const std::filesystem::path& movie) {
+        const auto sounds = Sounds(Describe(movie));
+        if (sounds.size() != 1) {
+            ADD_FAILURE() << movie << " has " << sounds.size() << " sounds";
+            return {};
+        }
+        return {Fact(sounds[0], "Channels"), Fact(sounds[0], "AudioSamplingRate"),
+                Fact(sounds[0], "Length")};
+    }
+    // All that is delivered; the form is held against the description.
+    EssenceBytes Delivered(const std::filesystem::path& movie) {
+        const Said said = Described(movie);
+        Essence essence(session(), movie);
+        SoundReader reader(essence, essence.tracks().at(0));
+        EXPECT_EQ(std::to_string(reader.form().channels), said.channels);
+        EXPECT_EQ(std::to_string(reader.form().rate) + "/1", said.rate);
+        EXPECT_EQ(std::to_string(reader.Count()), said.length);
+        const auto block = reader.Read(0, reader.Count());
+        EXPECT_FALSE(block.isSilence);
+        return {block.bytes, block.bytes + block.size};
+    }
+    // Ranges, each read by a reader of its own, are those of `all`.
+    void ExpectRangesOf(const std::filesystem::path& movie, const EssenceBytes& all) {
+        std::mt19937 random(11);
+        for (int i = 0; i < 12; ++i) {
+            Essence essence(session(), movie);
+            SoundReader reader(essence, essence.tracks().at(0));
+            const std::size_t frame = reader.form().FrameBytes();
+            const std::uint64_t at = random() % reader.Count();
+            const std::uint64_t count =
+                1 + random() % std::min<std::uint64_t>(5000, reader.Count() - at);
+            const auto block = reader.Read(at, count);
+            ASSERT_EQ(block.size, count * frame);
+            ASSERT_TRUE(std::equal(block.bytes, block.bytes + block.size,
+                                   all.begin() + static_cast<std::ptrdiff_t>(at * frame)))
+                << count << " from " << at;
+        }
+    }
+    // `got` and `wanted` are the same as far as both reach, which is far enough.
+    static void ExpectSame(const EssenceBytes& got, EssenceBytes wanted,
+                           std::size_t mayDiffer = 0) {
+        ASSERT_FALSE(got.empty());
+        ASSERT_LE(
+            wanted.size() > got.size() ? wanted.size() - got.size() : got.size() - wanted.size(),
+            mayDiffer);
+        const std::size_t both = std::min(got.size(), wanted.size());
+        const auto end = got.begin() + static_cast<std::ptrdiff_t>(both);
+        const auto differs = std::mismatch(got.begin(), end, wanted.begin());
+        EXPECT_TRUE(differs.first == end) << "from byte " << differs.first - got.begin();
+    }
+};
+
+constexpr char kHum[] = "-f lavfi -i sine=440:d=1:sample_rate=";
+
+TEST_F(SoundForms, OfCompressedSoundAreThoseThatItsDecoderGives) {
+    struct Kind {
+        const char* arguments;
+        const char* name;
+        const char* decoder = "";
+    };
+    for (const Kind& kind :
+         {Kind{"-c:a libmp3lame", "mp3.mp4"}, Kind{"-c:a mp2", "mp2.mp4", "-c:a mp2float "},
+          Kind{"-c:a libvorbis", "vorbis.mp4"}, Kind{"-c:a libmp3lame", "mp3.mov"},
+          Kind{"-c:a mp2", "mp2.mov", "-c:a mp2float "}, Kind{"-c:a ac3 -cutoff 8000", "ac3.mp4"},
+          Kind{"-c:a flac -strict -2", "flac.mp4"}, Kind{"-c:a alac", "alac.mp4"},
+          Kind{"-c:a aac -aac_pns 0", "aac.mp4"}}) {
+        for (const int channels : {1, 2}) {
+            SCOPED_TRACE(kind.name + std::string(" ") + std::to_string(channels));
+            const auto movie = Make(
+                kHum + std::string("48000 -ac ") + std::to_string(channels) + " " + kind.arguments,
+                kind.name);
+            EXPECT_EQ(Described(movie).channels, std::to_string(channels));
+            EXPECT_EQ(Described(movie).rate, "48000/1");
+            const CommandResult wanted =
+                RunCommand("ffmpeg -nostdin -v quiet " + std::string(kind.decoder) + "-i " +
+                           Quoted(movie) + " -f s24le -c:a pcm_s24le -");
+            EssenceBytes all(wanted.out.begin(), wanted.out.end());
+            const EssenceBytes got = Delivered(movie);
+            ASSERT_GE(all.size(), got.size());
+            all.resize(got.size());  // what lies behind the clip's length
+            ExpectSame(got, all);
+        }
+    }
+}
+
+// A track begins with two channels and goes on with one: both of the two have it.
+TEST_F(SoundForms, ThatChangeChannelsOnTheWayAreMixed) {
+    const auto two = Make(kHum + std::string("44100 -ac 2 -c:a libmp3lame -write_xing 0 "
+                                             "-id3v2_version 0"),
+                          "two.mp3");
+    const auto one = Make(
+        "-f lavfi -i sine=997:d=1:sample_rate=44100 -c:a libmp3lame "
+        "-write_xing 0 -id3v2_version 0",
+        "one.mp3");
+    movies::SoundFormat format;
+    format.codec = ".mp3";
+    format.rate = 44100;
+    const SoundPackets first = SoundPacketsOf(two);
+    const SoundPackets second = SoundPacketsOf(one);
+    const auto movie =
+        WriteSound(SoundTrackOf(Joined(first, second), format, 44100, 1152), "both.mov");
+    EXPECT_EQ(Described(movie).channels, "2");
+    const EssenceBytes got = Delivered(movie);
+    const std::size_t frames = (first.size() + second.size()) * 1152;
+    ASSERT_EQ(got.size(), frames * 6);
+    // Behind the seam, where the decoder has settled, it is what one channel gives.
+    const auto alone = WriteSound(SoundTrackOf(second, format, 44100, 1152), "alone.mov");
+    const EssenceBytes wanted = Decoded(alone, "-ac 2 -f s24le -c:a pcm_s24le");
+    const std::size_t settled = 4 * 1152 * 6;
+    ASSERT_EQ(wanted.size(), second.size() * 1152 * 6);
+    const EssenceBytes tail(
+        got.begin() + static_cast<std::ptrdiff_t>(first.size() * 1152 * 6 + settled), got.end());
+    std::size_t most = 0;
+    for (std::size_t i = 0; i + 2 < tail.size(); i += 3) {
+        const auto word = [](const EssenceBytes& from, std::size_t at) {
+            return static_cast<std::int32_t>(static_cast<std::uint32_t>(
+                       from[at] << 8 | from[at + 1] << 16 | from[at + 2] << 24)) /
+                   256;
+        };
+        most = std::max<std::size_t>(
+            most, static_cast<std::size_t>(std::abs(word(tail, i) - word(wanted, settled + i))));
+    }
+    EXPECT_LE(most, 2u);
+    ExpectRangesOf(movie, got);
+}
+
+// The higher rate of the second half is brought to that of the first, so it
+// lasts as long and sounds as high as before.
+TEST_F(SoundForms, ThatChangeTheRateOnTheWayAreResampled) {
+    const std::string plain = " -c:a libmp3lame -b:a 192k -write_xing 0 -id3v2_version 0";
+    const auto slow = Make("-f lavfi -i sine=440:d=1:sample_rate=44100" + plain, "slow.mp3");
+    const auto fast = Make("-f lavfi -i sine=1000:d=2:sample_rate=48000" + plain, "fast.mp3");
+    movies::SoundFormat format;
+    format.codec = ".mp3";
+    format.channels = 1;
+    format.rate = 44100;
+    const SoundPackets first = SoundPacketsOf(slow);
+    const SoundPackets second = SoundPacketsOf(fast);
+    // A time unit in which packets of either rate last whole numbers.
+    movies::Track track = SoundTrackOf(Joined(first, second), format, 7056000, 1152 * 160);
+    for (std::size_t i = first.size(); i < track.samples.size(); ++i) {
+        track.samples[i].duration = 1152 * 147;
+    }
+    const auto movie = WriteSound(track, "both.mov");
+    EXPECT_EQ(Described(movie).rate, "44100/1");
+    const EssenceBytes got = Delivered(movie);
+    const double seconds = static_cast<double>(first.size()) * 1152 / 44100 +
+                           static_cast<double>(second.size()) * 1152 / 48000;
+    EXPECT_NEAR(static_cast<double>(got.size()) / 3, seconds * 44100, 2.0);
+    // A second out of the middle of the second half rises through zero a
+    // thousand times, at the level of the first.
+    const std::size_t from = first.size() * 1152 + 22050;
+    int rises = 0;
+    int loudest = 0;
+    for (std::size_t i = from; i < from + 44100; ++i) {
+        const auto high = [&](std::size_t at) { return static_cast<signed char>(got[at * 3 + 2]); };
+        rises += high(i) < 0 && high(i + 1) >= 0;
+        loudest = std::max(loudest, std::abs(static_cast<int>(high(i))));
+    }
+    EXPECT_NEAR(rises, 1000, 1);
+    EXPECT_NEAR(loudest, 16, 1);  // an eighth of full scale
+    ExpectRangesOf(movie, got);
+}
+
+// The configuration of AAC stands in a movie's description; here that of plain
+// AAC is made into one that announces more, so that decoders double the rate,
+// and make two channels of one.
+TEST_F(SoundForms, OfAnnouncedExtensionsOfAacAreThoseThatComeOut) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=1:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = SoundPacketsOf(plain);
+    struct Kind {
+        const char* name;
+        Bytes config;
+        const char* channels;
+    };
+    for (const Kind& kind :
+         {Kind{"bands, told behind", {0x13, 0x88, 0x56, 0xE5, 0xA0}, "1"},
+          Kind{"bands, told behind, no stereo", {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x00}, "1"},
+          Kind{"stereo, told behind", {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x80}, "2"},
+          Kind{"bands, told in front", {0x2B, 0x8A, 0x08, 0x00}, "1"},
+          Kind{"stereo, told in front", {0xEB, 0x8A, 0x08, 0x00}, "2"}}) {
+        for (const bool isWave : {false, true}) {
+            SCOPED_TRACE(kind.name + std::string(isWave ? " in wave" : ""));
+            movies::SoundFormat format = Mpeg4Sound(0x40, kind.config, 2, 22050);
+            format.wave = isWave;
+            format.version = isWave ? 1 : 0;
+            const auto movie = WriteSound(SoundTrackOf(packets, format, 22050, 1024), "more.mov");
+            const Said said = Described(movie);
+            EXPECT_EQ(said.rate, "44100/1");
+            EXPECT_EQ(said.channels, kind.channels);
+            EXPECT_EQ(said.length, std::to_string(packets.size() * 2048));
+            const EssenceBytes got = Delivered(movie);
+            ExpectSame(got, Decoded(movie, "-f s24le -c:a pcm_s24le"));
+            ExpectRangesOf(movie, got);
+        }
+    }
+}
+
+// A writer rounded the length of each packet, not its end: 1115 units of 48000
+// for 1024 frames at 44100. The sound goes on without a gap.
+TEST_F(SoundForms, AreContinuousWhereEachStepIsRounded) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=4:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = SoundPacketsOf(plain);
+    const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
+    const auto exact = WriteSound(SoundTrackOf(packets, format, 44100, 1024), "exact.mov");
+    const auto rounded = WriteSound(SoundTrackOf(packets, format, 48000, 1115), "rounded.mov");
+    const EssenceBytes wanted = Delivered(exact);
+    const EssenceBytes got = Delivered(rounded);
+    ASSERT_GE(got.size(), wanted.size());
+    ExpectSame({got.begin(), got.begin() + static_cast<std::ptrdiff_t>(wanted.size())}, wanted);
+    ExpectRangesOf(rounded, got);
+}
+
+// What one packet's own step leaves empty is silence, and what follows it is
+// in its place.
+TEST_F(SoundForms, KeepTheGapThatAStepLeaves) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=2:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = SoundPacketsOf(plain);
+    const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
+    const auto exact = WriteSound(SoundTrackOf(packets, format, 44100, 1024), "exact.mov");
+    movies::Track track = SoundTrackOf(packets, format, 48000, 1115);
+    track.samples[40].duration += 4800;  // 4410 frames
+    const auto gap = WriteSound(track, "gap.mov");
+    EssenceBytes wanted = Delivered(exact);
+    wanted.insert(wanted.begin() + 41 * 1024 * 3, 4410 * 3, 0);
+    const EssenceBytes got = Delivered(gap);
+    ASSERT_GE(got.size(), wanted.size());
+    ExpectSame({got.begin(), got.begin() + static_cast<std::ptrdiff_t>(wanted.size())}, wanted);
+    ExpectRangesOf(gap, got);
+}
+
+TEST_F(SoundForms, OfTelephoneSoundHaveAllBlocksOfASample) {
+    const SoundPackets blocks = TelephoneBlocks(60, 5);
+    movies::SoundFormat format;
+    format.codec = "samr";
+    format.channels = 2;  // a template
+    format.rate = 8000;
+    const auto single = WriteSound(SoundTrackOf(blocks, format, 8000, 160), "single.mov");
+    SoundPackets threes;
+    for (std::size_t i = 0; i < blocks.size(); i += 3) {
+        movies::Bytes sample;
+        for (std::size_t j = i; j < i + 3; ++j) {
+            sample.insert(sample.end(), blocks[j].begin(), blocks[j].end());
+        }
+        threes.push_back(sample);
+    }
+    const auto several = WriteSound(SoundTrackOf(threes, format, 8000, 480), "several.mov");
+    EXPECT_EQ(Described(several).channels, "1");
+    EXPECT_EQ(Described(several).rate, "8000/1");
+    EXPECT_EQ(Described(several).length, "9600");
+    const EssenceBytes wanted = Delivered(single);
+    ASSERT_EQ(wanted.size(), 60u * 160 * 3);
+    EXPECT_GT(std::count_if(wanted.end() - 480, wanted.end(), [](auto byte) { return byte != 0; }),
+              200);
+    ExpectSame(Delivered(several), wanted);
+}
+
+// Linear sound of the ISO forms is read by the host itself where its depth is
+// one that the host takes, and comes bit for bit out of the provider.
+TEST_F(SoundForms, OfIsoLinearSoundAreLinear) {
+    struct Kind {
+        const char* codec;
+        unsigned bits;
+        bool isLittle;
+        const char* source;
+        const char* label;
+    };
+    for (const Kind& kind : {Kind{"ipcm", 16, true, "s16le", "little-endian 2 x 48000/1"},
+                             Kind{"ipcm", 24, false, "s24be", "big-endian 2 x 48000/1"},
+                             Kind{"ipcm", 32, true, "s32le", "provider 2 x 48000/1"},
+                             Kind{"fpcm", 32, true, "f32le", "provider 2 x 48000/1"},
+                             Kind{"fpcm", 32, false, "f32be", "provider 2 x 48000/1"},
+                             Kind{"fpcm", 64, true, "f64le", "provider 2 x 48000/1"},
+                             Kind{"fpcm", 64, false, "f64be", "provider 2 x 48000/1"}}) {
+        SCOPED_TRACE(kind.codec + std::string(" ") + kind.source);
+        const auto raw = Make(
+            "-f lavfi -i sine=440:d=0.2:sample_rate=48000 -ac 2 -f " + std::string(kind.source),
+            "raw");
+        movies::SoundFormat format;
+        format.codec = kind.codec;
+        format.bits = kind.bits;
+        format.extensions = {
+            movies::Box("pcmC").Version(0).U8(kind.isLittle ? 1 : 0).U8(kind.bits)};
+        movies::Track track = movies::SoundTrack(format, 9600);
+        track.samples[0].size = kind.bits / 8 * 2;
+        track.data = ReadFile(raw);
+        ASSERT_EQ(track.data.size(), 9600u * kind.bits / 8 * 2);
+        const auto movie = WriteSound(track, "linear.mov");
+        const std::string line = SoundLine(Describe(movie));
+        EXPECT_EQ(line.substr(0, std::string(kind.label).size()), kind.label) << line;
+        EXPECT_NE(line.find(" 9600 samples"), std::string::npos) << line;
+        const CommandResult wanted =
+            RunCommand("ffmpeg -nostdin -v quiet -f " + std::string(kind.source) +
+                       " -ar 48000 -ac 2 -i " + Quoted(raw) + " -f s24le -c:a pcm_s24le -");
+        ExpectSame(Delivered(movie), {wanted.out.begin(), wanted.out.end()});
+    }
+}
+
+}  // namespace
