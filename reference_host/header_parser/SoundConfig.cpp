@@ -63,20 +63,24 @@ ncfUInt32 TakeProgramChannels(BitReader& bits) {
     return bits.Failed() ? 0 : channels;
 }
 
-// The configuration of AAC. Extensions stand in front, in the place of the
-// object type, or behind, where older decoders pass them over. Without either
-// the packets may hold them all the same.
+// Whether packets hold an extension.
+enum class Extension { kUntold, kNo, kYes };
+
+// The configuration of AAC. Extensions are announced in front, in the place of
+// the object type, or behind, where older decoders pass them over. Without
+// either the packets may hold them all the same.
 Told ReadAacConfig(const Atom& config) {
     constexpr ncfUInt32 kChannels[] = {0, 1, 2, 3, 4, 5, 6, 8, 0, 0, 0, 7, 8, 24, 8, 0};
     BitReader bits(config.begin, config.end);
     ncfUInt32 type = TakeObjectType(bits);
-    const ncfUInt32 coreRate = TakeAacRate(bits);
+    const ncfUInt32 rate = TakeAacRate(bits);
     const ncfUInt32 arrangement = bits.Take(4);
-    bool isTold = type == kSpectralBands || type == kParametricStereo;
-    bool isStereo = type == kParametricStereo;
-    ncfUInt32 rate = coreRate;
-    if (isTold) {
-        rate = TakeAacRate(bits);
+    Extension bands = Extension::kUntold;
+    Extension stereo = type == kParametricStereo ? Extension::kYes : Extension::kUntold;
+    ncfUInt32 extendedRate = 0;
+    if (type == kSpectralBands || type == kParametricStereo) {
+        bands = Extension::kYes;
+        extendedRate = TakeAacRate(bits);
         type = TakeObjectType(bits);
     }
     Told told;
@@ -91,29 +95,34 @@ Told ReadAacConfig(const Atom& config) {
     }
     constexpr ncfUInt32 kBandsFollow = 0x2B7;
     constexpr ncfUInt32 kStereoFollows = 0x548;
-    while (!isTold && bits.Left() > 15) {
+    while (bands == Extension::kUntold && bits.Left() > 15) {
         if (bits.Show(11) != kBandsFollow) {
             bits.Skip(1);
             continue;
         }
         bits.Skip(11);
-        isTold = TakeObjectType(bits) == kSpectralBands;
-        if (!isTold || !bits.Flag()) {
-            break;
-        }
-        rate = TakeAacRate(bits);
-        if (bits.Left() > 11 && bits.Take(11) == kStereoFollows) {
-            isStereo = bits.Flag();
+        const bool isThere = TakeObjectType(bits) == kSpectralBands && bits.Flag();
+        bands = isThere ? Extension::kYes : Extension::kNo;
+        extendedRate = isThere ? TakeAacRate(bits) : 0;
+        if (isThere && bits.Left() > 11 && bits.Take(11) == kStereoFollows) {
+            stereo = bits.Flag() ? Extension::kYes : Extension::kNo;
         }
     }
-    if (bits.Failed() || coreRate == 0) {
+    if (bits.Failed() || rate == 0) {
         return Told();
     }
-    // The decoder makes twice the core's rate, whatever the extension names.
-    told.rate = rate > coreRate ? 2 * coreRate : coreRate;
-    told.channels = isStereo && told.channels == 1 ? 2 : told.channels;
-    const bool maySayMore = !isTold && type == kLowComplexity;
-    told.open = maySayMore ? Open::kAac : Open::kNothing;
+    if (bands == Extension::kYes && extendedRate == rate) {
+        bands = Extension::kUntold;
+    }
+    // The decoder makes twice the core's rate, whatever the extension names, and
+    // two channels of one unless it is told that it need not.
+    const bool isDoubled = bands == Extension::kYes && extendedRate > rate;
+    told.rate = isDoubled ? 2 * rate : rate;
+    if (told.channels == 1 && bands == Extension::kYes && stereo != Extension::kNo) {
+        told.channels = 2;
+    }
+    const bool mayHoldMore = bands == Extension::kUntold && type == kLowComplexity;
+    told.open = mayHoldMore ? Open::kAac : Open::kNothing;
     return told;
 }
 

@@ -39,23 +39,25 @@ std::unique_ptr<SoundCodec> SoundCodec::Open(const AVStream& stream, bool keepsP
         return nullptr;
     }
     std::unique_ptr<SoundCodec> opened(new SoundCodec(std::move(codec)));
-    if (NeedsDivision(stream.codecpar->codec_id)) {
-        opened->parser_.reset(av_parser_init(stream.codecpar->codec_id));
-    }
+    opened->dividesPackets_ = NeedsDivision(stream.codecpar->codec_id);
     return opened;
 }
 
-// The first part keeps the packet's time; the others follow it.
+// The first part keeps the packet's time; the others follow it. The parser gives
+// a part when it sees what is behind it, so the last comes with the end, and a
+// parser does not go on behind that.
 void SoundCodec::Divide(const AVPacket& packet) {
+    const ParserOwner parser(av_parser_init(codec_->codec_id));
     const ncfUInt8* at = packet.data;
     int left = packet.size;
     bool isFirst = true;
-    while (left > 0) {
+    for (bool isEnd = !parser; !isEnd;) {
+        isEnd = left == 0;
         ncfUInt8* part = nullptr;
         int size = 0;
-        const int used = av_parser_parse2(parser_.get(), codec_.get(), &part, &size, at, left,
-                                          packet.pts, packet.dts, packet.pos);
-        if (used < 0 || (used == 0 && size == 0)) {
+        const int used = av_parser_parse2(parser.get(), codec_.get(), &part, &size,
+                                          isEnd ? nullptr : at, left, packet.pts, packet.dts, -1);
+        if (used < 0 || used > left || (used == 0 && size == 0)) {
             return;
         }
         at += used;
@@ -74,7 +76,7 @@ void SoundCodec::Divide(const AVPacket& packet) {
 }
 
 void SoundCodec::Send(const AVPacket* packet) {
-    if (!parser_) {
+    if (!dividesPackets_) {
         avcodec_send_packet(codec_.get(), packet);
     } else if (packet) {
         Divide(*packet);
@@ -105,9 +107,6 @@ void SoundCodec::Flush() {
     avcodec_flush_buffers(codec_.get());
     parts_.clear();
     isEnding_ = false;
-    if (parser_) {
-        parser_.reset(av_parser_init(codec_->codec_id));
-    }
 }
 
 }  // namespace host

@@ -30,7 +30,7 @@ private:
     void Divide(const AVPacket& packet);
 
     CodecOwner codec_;
-    ParserOwner parser_;             // null for most
+    bool dividesPackets_ = false;
     std::deque<PacketOwner> parts_;  // of the last packet, not yet decoded
     bool isEnding_ = false;
 };
