@@ -61,6 +61,24 @@ TEST_F(QuickTimeClipContentHash, TakesTheHeaderThenAChunkOfEachTrack) {
     EXPECT_EQ(content, expected);
 }
 
+TEST_F(QuickTimeClipContentHash, TakesEveryTrackOfEachKind) {
+    SetChunk(*parser->AddVideoTrack(11), 2100, 7);
+    SetChunk(*parser->AddAudioTrack(2), 3000, 20);
+    SetChunk(*parser->AddAudioTrack(12), 3100, 8);
+    SetChunk(*parser->AddTimecodeTrack(3), 4000, 4);
+    SetChunk(*parser->AddTimecodeTrack(13), 4100, 5);
+    SetChunk(*parser->AddOtherTrack(4), 5000, 10);
+    SetChunk(*parser->AddOtherTrack(14), 5100, 6);
+    Load();
+    ASSERT_EQ(Ask(), NCF_OK);
+    Bytes expected = Part(100, 300);
+    for (const Bytes& chunk : {Part(2000, 50), Part(2100, 7), Part(3000, 20), Part(3100, 8),
+                               Part(4000, 4), Part(4100, 5), Part(5000, 10), Part(5100, 6)}) {
+        expected = Joined(expected, chunk);
+    }
+    EXPECT_EQ(content, expected);
+}
+
 TEST_F(QuickTimeClipContentHash, RestsOnTheHeaderAloneWithExternalMedia) {
     parser->selfContained = 0;
     Load();
