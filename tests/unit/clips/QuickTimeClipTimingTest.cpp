@@ -86,6 +86,13 @@ TEST_F(QuickTimeClipTiming, TakesTheEditorsRateForSoundOnly) {
     EXPECT_EQ(RateOf(Forced(25.0, 50.0)), (Rational{25, 1}));
 }
 
+TEST_F(QuickTimeClipTiming, TakesASlowEditorsRate) {
+    parser->AddAudioTrack(1);
+    Load();
+    EXPECT_EQ(RateOf(Settings(1.0)), (Rational{1, 1}));
+    EXPECT_EQ(clip->SetEditRate(Settings(0.011)), NCF_OK) << "taken, though it rounds to nothing";
+}
+
 TEST_F(QuickTimeClipTiming, NeedsAnEditorsRateForSoundOnly) {
     parser->AddAudioTrack(1);
     Load();

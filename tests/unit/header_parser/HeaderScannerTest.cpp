@@ -86,6 +86,13 @@ TEST(HeaderScanner, TakesAHeaderThatReachesTheEnd) {
     ExpectFound(movie);
 }
 
+TEST(HeaderScanner, TakesAnEmptyAtomInAHeaderThatReachesTheEnd) {
+    Movie movie = PlainMovie();
+    movie.headerToEnd = true;
+    movie.inHeader = {Box("free"), Box("free").U32(1), Box("free")};
+    ExpectFound(movie);
+}
+
 // The end of the file is not seen, so the read for what follows must hit at
 // least one byte that is there.
 TEST(HeaderScanner, TakesAHeaderThatReachesTheEndAtAnyLengthOfARead) {

@@ -113,6 +113,27 @@ TEST_P(WholeMovieTest, IsTakenOrRefusedWithRandomDamage) {
     }
 }
 
+TEST(ParserLimits, EachTakesWhatComesUpToIt) {
+    using header_parser::ParserLimits;
+    movies::Movie movie = PlainMovie();
+    movie.tracks.push_back(movie.tracks.front());
+    movie.leading = {movies::Box("free"), movies::Box("free")};
+    movie.tracks[0].edits = {{300, 0, 1.0}, {300, 0, 1.0}};
+    movies::VideoFormat format;
+    format.rasterText.emplace(100, 'x');
+    movie.tracks[0].descriptions = {format.ToBox(), format.ToBox()};
+    ParserLimits limits;
+    limits.maxTracks = 2;
+    limits.maxTopLevelAtoms = 5;  // ftyp, free, free, mdat, moov
+    limits.maxHeaderBytes = movies::Build(movie).headerSize;
+    limits.maxEditsInTrack = 2;
+    limits.maxDescriptionsInTrack = 2;
+    limits.maxAttributeText = 100;
+    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_OK) << ParsedMovie(movie, limits).Reason();
+    --limits.maxHeaderBytes;
+    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
+}
+
 TEST(ParserLimits, EachRefusesAMovieThatTheDefaultTakes) {
     using header_parser::ParserLimits;
     movies::Movie movie = PlainMovie();
