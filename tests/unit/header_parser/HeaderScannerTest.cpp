@@ -93,6 +93,14 @@ TEST(HeaderScanner, TakesAnEmptyAtomInAHeaderThatReachesTheEnd) {
     ExpectFound(movie);
 }
 
+TEST(HeaderScanner, TakesASixtyFourBitSizeInAHeaderThatReachesTheEnd) {
+    Movie movie = PlainMovie();
+    movie.headerToEnd = true;
+    movie.inHeader = {Box("free").LargeSize().Zeros(30), Box("free").LargeSize(),
+                      Box("free").U32(1)};
+    ExpectFound(movie);
+}
+
 // The end of the file is not seen, so the read for what follows must hit at
 // least one byte that is there.
 TEST(HeaderScanner, TakesAHeaderThatReachesTheEndAtAnyLengthOfARead) {
