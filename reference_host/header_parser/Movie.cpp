@@ -81,6 +81,14 @@ Verdict SortParts(const ParserLimits& limits, Movie& movie, HeaderParts& parts) 
     return parts.header.isPresent ? Fine() : Broken("the movie has no mvhd");
 }
 
+ncfUInt32 ChannelsOf(const Track& track) {
+    ncfUInt32 most = 0;
+    for (const SoundDescription& description : track.sound) {
+        most = std::max(most, description.channels);
+    }
+    return most;
+}
+
 Verdict SetDuration(const MovieHeader& header, Movie& movie) {
     if (header.duration && *header.duration > kMax32) {
         return NotSupported("the movie's duration does not fit 32 bits");
@@ -113,11 +121,16 @@ Verdict ReadMovie(HeaderBytes&& bytes, const ParserLimits& limits, Movie& movie)
     if (verdict.Refused()) {
         return verdict;
     }
+    ncfUInt32 channels = 0;
     for (const Atom& trak : parts.tracks) {
         movie.tracks.emplace_back();
         verdict = ReadTrack(trak, movie.timeScale, limits, movie.tracks.back());
         if (verdict.Refused()) {
             return verdict;
+        }
+        channels += ChannelsOf(movie.tracks.back());
+        if (channels > limits.maxSoundChannels) {
+            return TooMuch("the sounds of the movie have more than 1024 channels together");
         }
         movie.ofKind[static_cast<std::size_t>(movie.tracks.back().kind)].push_back(
             static_cast<ncfUInt32>(movie.tracks.size() - 1));

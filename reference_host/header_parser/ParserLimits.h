@@ -23,6 +23,8 @@ struct ParserLimits {
     ncfUInt32 maxInflationRatio = 100;
     ncfUInt64 maxInflatedBytes = ncfUInt64{64} << 20;
     ncfUInt32 maxTracks = 4096;
+    // Of all sounds together; each is a track of its own for the user.
+    ncfUInt32 maxSoundChannels = 1024;
     ncfUInt32 maxDescriptionsInTrack = 4096;
     ncfUInt32 maxEditsInTrack = 1u << 20;
     ncfUInt32 maxAttributeText = 1u << 20;

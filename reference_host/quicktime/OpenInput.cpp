@@ -5,8 +5,10 @@
 
 extern "C" {
 #include <libavutil/dict.h>
+#include <libavutil/mem.h>
 }
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <fstream>
@@ -14,9 +16,16 @@ extern "C" {
 #include <string_view>
 
 #include "reference_host/quicktime/MovieAtoms.h"
+#include "reference_host/quicktime/TableClaims.h"
 
 namespace host {
 namespace {
+
+// The largest block that the library may ask for. A picture of 16384 x 16384
+// with an alpha takes all of it.
+constexpr std::size_t kLargestBlock = std::size_t{1} << 30;
+// Of all sounds of a movie together, as the header parser has it.
+constexpr int kMostChannels = 1024;
 
 constexpr int kBufferBytes = 32768;
 
@@ -130,6 +139,27 @@ void NameFloatSound(AVFormatContext& input, const std::filesystem::path& path) {
     }
 }
 
+int CountChannels(const AVFormatContext& input) {
+    int channels = 0;
+    for (unsigned i = 0; i < input.nb_streams && channels <= kMostChannels; ++i) {
+        const int more = input.streams[i]->codecpar->ch_layout.nb_channels;
+        channels += std::clamp(more, 0, kMostChannels + 1);
+    }
+    return channels;
+}
+
+// What is wrong with an input that the library opened, empty for nothing.
+std::string FindFault(const AVFormatContext& input) {
+    if (input.nb_streams == 0) {
+        return "the file holds no tracks";
+    }
+    if (CountChannels(input) > kMostChannels) {
+        return "the sounds of the movie have more than " + std::to_string(kMostChannels) +
+               " channels together";
+    }
+    return {};
+}
+
 }  // namespace
 
 void CloseInput::operator()(AVFormatContext* context) const {
@@ -146,6 +176,13 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
         reason = "the file can't be read";
         return nullptr;
     }
+    if (std::string claim = FindImpossibleTable(path); !claim.empty()) {
+        avformat_free_context(opened);
+        CloseBytes(bytes);
+        reason = std::move(claim);
+        return nullptr;
+    }
+    av_max_alloc(kLargestBlock);
     opened->pb = bytes;
     AVDictionary* options = nullptr;
     // The bytes are at hand, so no way of reaching a file is needed.
@@ -164,14 +201,11 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     if (IsMovieFamily(*input)) {
         NameFloatSound(*input, path);
     }
-    if (!AreStreamsKnown(*input)) {
+    if (CountChannels(*input) <= kMostChannels && !AreStreamsKnown(*input)) {
         FindStreamDetails(*input);
     }
-    if (input->nb_streams == 0) {
-        reason = "the file holds no tracks";
-        return nullptr;
-    }
-    return input;
+    reason = FindFault(*input);
+    return reason.empty() ? std::move(input) : nullptr;
 }
 
 bool IsMovieFamily(const AVFormatContext& input) {

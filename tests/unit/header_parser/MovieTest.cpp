@@ -76,6 +76,21 @@ TEST(Movie, TakesAHeaderThatStandsBehindItsTracks) {
     EXPECT_EQ(Ask(parsed.Video(), &ITrackInfo::GetTrackDuration), 600u);
 }
 
+TEST(Movie, HasAtMost1024ChannelsOfSoundInAllItsTracks) {
+    Movie movie;
+    movies::SoundFormat sound;
+    for (const unsigned channels : {1000u, 20u, 4u}) {
+        sound.channels = channels;
+        movie.tracks.push_back(movies::SoundTrack(sound, 10));
+    }
+    EXPECT_EQ(ParsedMovie(movie).Result(), NCF_OK);
+    sound.channels = 1;
+    movie.tracks.push_back(movies::SoundTrack(sound, 10));
+    const ParsedMovie parsed(movie);
+    EXPECT_EQ(parsed.Result(), NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(parsed.Reason(), "the sounds of the movie have more than 1024 channels together");
+}
+
 TEST(Movie, WithoutTracksIsTakenWithNoneOfAnyKind) {
     Movie movie;
     const ParsedMovie parsed(movie);
