@@ -88,6 +88,12 @@ TEST_F(QuickTimeClipGeometry, TakesTheRatioByItsTwoNumbersOnly) {
     // 32/18 is the same ratio, but not the same numbers.
     ExpectSize(SourceOf(720, 576, 32, 18), {600, 1}, {10800, 32});
     ExpectSize(SourceOf(720, 576, 8, 6), {600, 1}, {450, 1});
+    // One of the two alone is not enough.
+    const std::pair<ncfUInt32, ncfUInt32> kHalves[] = {{16, 15}, {5, 9}, {4, 5}, {5, 3}};
+    for (const auto& [numerator, denominator] : kHalves) {
+        EXPECT_EQ(SourceOf(720, 576, numerator, denominator).width, (Rational{600, 1}))
+            << numerator << ":" << denominator;
+    }
 }
 
 TEST_F(QuickTimeClipGeometry, SwapsWidthAndHeightOfRotatedMovies) {
