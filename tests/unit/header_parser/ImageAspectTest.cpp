@@ -96,4 +96,20 @@ TEST(ImageAspect, OfADescriptionIgnoresImpossibleAtoms) {
     EXPECT_EQ(aspect(format), "none");
 }
 
+TEST(ImageAspect, OfADescriptionNeedsWidthAndHeight) {
+    const auto result = [](unsigned width, unsigned height) {
+        movies::Movie movie = PlainMovie();
+        movies::VideoFormat format;
+        format.width = width;
+        format.height = height;
+        movie.tracks[0].descriptions = {format.ToBox()};
+        ncfUInt32 above = 0;
+        ncfUInt32 below = 0;
+        return ParsedMovie(movie).VideoDescription()->GetImageAspectRatio(&above, &below);
+    };
+    EXPECT_EQ(result(0, 1080), NCF_E_PARAMETERNOTAVAILABLE);
+    EXPECT_EQ(result(1920, 0), NCF_E_PARAMETERNOTAVAILABLE);
+    EXPECT_EQ(result(1, 1), NCF_OK);
+}
+
 }  // namespace

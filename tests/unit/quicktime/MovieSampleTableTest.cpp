@@ -135,6 +135,25 @@ TEST(MovieSampleTable, TellsWhereBytesStopFollowing) {
     }
 }
 
+// Its packets tell no durations and the file tells no length.
+TEST(MovieSampleTable, LetsTheLastSampleLastAsLongAsTheOneBefore) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=20:d=0.5 -c:v flv", ".flv");
+    const Table table = OpenTable(movie.Path());
+    ncfUInt64 count = 0;
+    ASSERT_EQ(table->GetNumSamples(1, &count), NCF_OK);
+    ASSERT_EQ(count, 10u);
+    for (ncfUInt64 sample = 1; sample <= count; ++sample) {
+        ncfSInt64 duration = 0;
+        ASSERT_EQ(table->GetDecodeDuration(1, sample, &duration), NCF_OK);
+        EXPECT_EQ(duration, 50) << sample;
+    }
+    const MadeMovie still("-f lavfi -i testsrc2=s=64x48 -frames:v 1 -c:v flv", ".flv");
+    ncfSInt64 duration = 77;
+    ASSERT_EQ(OpenTable(still.Path())->GetDecodeDuration(1, 1, &duration), NCF_OK);
+    EXPECT_EQ(duration, 0);
+}
+
 TEST(MovieSampleTable, RefusesNumbersThatThereAreNot) {
     NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -c:v mpeg4");
