@@ -189,6 +189,35 @@ TEST(VideoReader, BringsFullRangeToVideoRange) {
     EXPECT_EQ(AllOf(movie, "NVZ2")[0], 235);
 }
 
+// Three of ten bits in each word, in the order of eight bits: Cb Y Cr Y.
+std::vector<int> TenBitNumbers(const Bytes& packed) {
+    std::vector<int> numbers;
+    for (std::size_t i = 0; i + 4 <= packed.size(); i += 4) {
+        std::uint32_t word = 0;
+        std::memcpy(&word, packed.data() + i, sizeof word);
+        for (int shift = 0; shift < 30; shift += 10) {
+            numbers.push_back(static_cast<int>(word >> shift & 1023));
+        }
+    }
+    return numbers;
+}
+
+// Full range, chroma between lines, and RGB: none is delivered as it is stored.
+TEST(VideoReader, ConvertsToTenBitsAsToEight) {
+    NEEDS_FFMPEG();
+    for (const char* codec : {"-c:v mjpeg -pix_fmt yuvj422p -q:v 2", "-c:v mjpeg -pix_fmt yuvj420p",
+                              "-c:v qtrle -pix_fmt rgb24"}) {
+        const MadeMovie movie(std::string(kFilm) + "-frames:v 2 " + codec);
+        const Bytes eight = AllOf(movie, "2vuy");
+        const std::vector<int> ten = TenBitNumbers(AllOf(movie, "v210"));
+        ASSERT_EQ(eight.size(), 2u * 96 * 64 * 2) << codec;
+        ASSERT_EQ(ten.size(), eight.size()) << "96 pixels are whole groups";
+        for (std::size_t i = 0; i < ten.size(); ++i) {
+            ASSERT_NEAR(ten[i], 4 * eight[i], 3) << codec << " number " << i;
+        }
+    }
+}
+
 TEST(VideoReader, EndsAnOddLineWithBlueDifferenceAndLuma) {
     NEEDS_FFMPEG();
     const MadeMovie movie(
