@@ -238,7 +238,7 @@ const SoundForm* MovieFile::SoundFormOf(ncfUInt32 track) {
     }
     const auto [entry, isNew] = soundForms_.try_emplace(stream);
     SoundForm form;
-    if (isNew && ReadSoundForm(path_, *input_->streams[stream], form)) {
+    if (isNew && ReadSoundForm(path_, *input_->streams[stream], IndexIsWhole(), form)) {
         entry->second = form;
     }
     return entry->second ? &*entry->second : nullptr;

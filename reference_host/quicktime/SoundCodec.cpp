@@ -3,6 +3,10 @@
 
 #include "reference_host/quicktime/SoundCodec.h"
 
+extern "C" {
+#include <libavutil/opt.h>
+}
+
 #include <cstring>
 
 namespace host {
@@ -34,6 +38,11 @@ std::unique_ptr<SoundCodec> SoundCodec::Open(const AVStream& stream, bool keepsP
     codec->pkt_timebase = stream.time_base;
     if (keepsPriming) {
         codec->flags2 |= AV_CODEC_FLAG2_SKIP_MANUAL;
+    }
+    // What stands in for inaudible parts is made up: here out of each block, so
+    // that it does not hang on where decoding began. Few decoders have this.
+    if (decoder->priv_class) {
+        av_opt_set_int(codec->priv_data, "cons_noisegen", 1, 0);
     }
     if (avcodec_open2(codec.get(), decoder, nullptr) < 0) {
         return nullptr;

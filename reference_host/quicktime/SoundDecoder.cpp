@@ -13,8 +13,10 @@
 namespace host {
 namespace {
 
-// Compressed blocks lean on those before them; this many settle any of them.
+// Compressed blocks lean on those before them; this many settle any of them,
+// but where a block's loudness is told by the difference to the last.
 constexpr ncfSInt64 kPrerollFrames = 16 * 1152;
+constexpr ncfSInt64 kOpusPrerollFrames = 2 * 48000;
 // Reading on is cheaper than a seek up to here.
 constexpr ncfSInt64 kNearFrames = 96000;
 
@@ -22,6 +24,7 @@ constexpr ncfSInt64 kNearFrames = 96000;
 bool LeansOnAllBefore(AVCodecID codec) {
     switch (codec) {
         case AV_CODEC_ID_ADPCM_IMA_QT:
+        case AV_CODEC_ID_ADPCM_YAMAHA:
         case AV_CODEC_ID_ADPCM_G722:
         case AV_CODEC_ID_ADPCM_G726:
         case AV_CODEC_ID_MACE3:
@@ -55,7 +58,7 @@ std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& pa
     const AVStream& of = *input->streams[stream];
     auto codec = SoundCodec::Open(of, false);
     SoundForm form;
-    if (!codec || !ReadSoundForm(path, of, form)) {
+    if (!codec || !ReadSoundForm(path, of, hasWholeIndex, form)) {
         return nullptr;
     }
     UseOneStream(*input, stream);
@@ -110,7 +113,10 @@ ncfSInt64 SoundDecoder::PlaceOf(ncfSInt64 time) const {
 
 ncfSInt64 SoundDecoder::Preroll() const {
     const AVCodecParameters& form = *input_->streams[stream_]->codecpar;
-    return isLinear_ ? 0 : std::max<ncfSInt64>(kPrerollFrames, form.seek_preroll);
+    const bool isOpus = form.codec_id == AV_CODEC_ID_OPUS;
+    return isLinear_ ? 0
+                     : std::max<ncfSInt64>(isOpus ? kOpusPrerollFrames : kPrerollFrames,
+                                           form.seek_preroll);
 }
 
 void SoundDecoder::Rewind() {

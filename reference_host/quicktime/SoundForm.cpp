@@ -141,14 +141,19 @@ bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
     return true;
 }
 
-bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, SoundForm& out) {
+bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, bool hasWholeIndex,
+                   SoundForm& out) {
     SoundForm form;
     if (!ReadSoundForm(stream, form)) {
         return false;
     }
     if (form.bitsPerChannel == 0) {
         const DecodedSound decoded = DecodeFirstSound(path, stream.index);
-        if (decoded.channels > 0 && decoded.channels <= kMostChannels && decoded.rate > 0) {
+        const AVCodecParameters& told = *stream.codecpar;
+        const bool isMoreThanTold =
+            hasWholeIndex && told.codec_id == AV_CODEC_ID_AAC && decoded.rate > told.sample_rate;
+        if (decoded.channels > 0 && decoded.channels <= kMostChannels && decoded.rate > 0 &&
+            !isMoreThanTold) {
             form.channels = static_cast<ncfUInt32>(decoded.channels);
             form.sampleRate = decoded.rate;
             form.decodedPerPacket = decoded.framesPerPacket;

@@ -29,7 +29,10 @@ struct SoundForm {
 bool ReadSoundForm(const AVStream& stream, SoundForm& out);
 
 // As it is delivered: channels and rate of compressed sound are those that come
-// out of its decoder.
-bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, SoundForm& out);
+// out of its decoder. But where a movie's header can be read by itself,
+// `hasWholeIndex`, an extension of AAC that it does not announce does not count:
+// nobody could tell of it who does not decode.
+bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, bool hasWholeIndex,
+                   SoundForm& out);
 
 }  // namespace host

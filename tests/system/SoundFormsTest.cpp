@@ -103,7 +103,8 @@ TEST_F(SoundForms, OfCompressedSoundAreThoseThatItsDecoderGives) {
     for (const Kind& kind :
          {Kind{"-c:a libmp3lame", "mp3.mp4"}, Kind{"-c:a mp2", "mp2.mp4", "-c:a mp2float "},
           Kind{"-c:a libvorbis", "vorbis.mp4"}, Kind{"-c:a libmp3lame", "mp3.mov"},
-          Kind{"-c:a mp2", "mp2.mov", "-c:a mp2float "}, Kind{"-c:a ac3 -cutoff 8000", "ac3.mp4"},
+          Kind{"-c:a mp2", "mp2.mov", "-c:a mp2float "},
+          Kind{"-c:a ac3", "ac3.mp4", "-cons_noisegen 1 "},
           Kind{"-c:a flac -strict -2", "flac.mp4"}, Kind{"-c:a alac", "alac.mp4"},
           Kind{"-c:a aac -aac_pns 0", "aac.mp4"}}) {
         for (const int channels : {1, 2}) {
@@ -236,6 +237,32 @@ TEST_F(SoundForms, OfAnnouncedExtensionsOfAacAreThoseThatComeOut) {
     }
 }
 
+// Packets of AAC that double the rate without a word in the description: what it
+// says is what both readers say, and what is delivered.
+TEST_F(SoundForms, OfExtensionsOfAacThatNothingAnnouncesAreThoseOfTheCore) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=2:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = WithEmptyBandExtension(SoundPacketsOf(plain));
+    const auto movie = WriteSound(
+        SoundTrackOf(packets, Mpeg4Sound(0x40, {0x13, 0x88}, 1, 22050), 22050, 1024), "more.mov");
+    // The decoder does find the extension.
+    EXPECT_GT(Decoded(movie, "-f s24le -c:a pcm_s24le").size(), packets.size() * 2000 * 3);
+    const Said said = Described(movie);
+    EXPECT_EQ(said.rate, "22050/1");
+    EXPECT_EQ(said.channels, "1");
+    const double seconds = static_cast<double>(packets.size()) * 1024 / 22050;
+    EXPECT_EQ(said.length, std::to_string(InEditUnits(seconds, 22050)));
+    const EssenceBytes got = Delivered(movie);
+    ASSERT_EQ(got.size(), InEditUnits(seconds, 22050) * 3);
+    int rises = 0;
+    for (std::size_t i = 11025; i < 11025 + 22050; ++i) {
+        const auto high = [&](std::size_t at) { return static_cast<signed char>(got[at * 3 + 2]); };
+        rises += high(i) < 0 && high(i + 1) >= 0;
+    }
+    EXPECT_NEAR(rises, 440, 1);
+    ExpectRangesOf(movie, got);
+}
+
 // A writer rounded the length of each packet, not its end: 1115 units of 48000
 // for 1024 frames at 44100. The sound goes on without a gap.
 TEST_F(SoundForms, AreContinuousWhereEachStepIsRounded) {
@@ -294,6 +321,51 @@ TEST_F(SoundForms, OfTelephoneSoundHaveAllBlocksOfASample) {
     EXPECT_GT(std::count_if(wanted.end() - 480, wanted.end(), [](auto byte) { return byte != 0; }),
               200);
     ExpectSame(Delivered(several), wanted);
+}
+
+// Fragments that use the second of two descriptions: the first says another
+// number of channels.
+TEST_F(SoundForms, OfFragmentsAreThoseOfTheDescriptionInUse) {
+    const auto plain =
+        Make(kHum + std::string("48000 -ac 1 -c:a libopus -frag_duration 200000 "
+                                "-movflags frag_keyframe+empty_moov+default_base_moof"),
+             "one.mp4");
+    Bytes bytes = ReadFile(plain);
+    const auto place = [&](const std::string& name) {
+        const auto at = std::search(bytes.begin(), bytes.end(), name.begin(), name.end());
+        EXPECT_NE(at, bytes.end()) << name;
+        return static_cast<std::size_t>(at - bytes.begin()) - 4;
+    };
+    const auto add = [&](std::size_t at, std::size_t more) {
+        const std::size_t sum = (bytes[at + 2] << 8 | bytes[at + 3]) + more;
+        ASSERT_LT(sum, 65536u);
+        bytes[at + 2] = static_cast<std::uint8_t>(sum >> 8);
+        bytes[at + 3] = static_cast<std::uint8_t>(sum);
+    };
+    const std::size_t entry = place("stsd") + 16;
+    const std::size_t size = bytes[entry + 2] * 256u + bytes[entry + 3];
+    Bytes two(bytes.begin() + static_cast<std::ptrdiff_t>(entry),
+              bytes.begin() + static_cast<std::ptrdiff_t>(entry + size));
+    two[25] = 2;
+    two[place("dOps") - entry + 9] = 2;
+    add(place("stsd") + 12, 1);  // how many there are
+    add(place("trex") + 16, 1);  // which one fragments use
+    for (const char* const name : {"moov", "trak", "mdia", "minf", "stbl", "stsd"}) {
+        add(place(name), size);
+    }
+    bytes.insert(bytes.begin() + static_cast<std::ptrdiff_t>(entry), two.begin(), two.end());
+    const auto movie = Write(bytes, "two.mov");
+    EXPECT_EQ(Described(movie).channels, "2");
+    const EssenceBytes got = Delivered(movie);
+    // The decoder gives the one channel on both.
+    EssenceBytes wanted;
+    const EssenceBytes one = Delivered(Write(ReadFile(plain), "one.mov"));
+    for (std::size_t i = 0; i + 2 < one.size(); i += 3) {
+        const auto at = one.begin() + static_cast<std::ptrdiff_t>(i);
+        wanted.insert(wanted.end(), at, at + 3);
+        wanted.insert(wanted.end(), at, at + 3);
+    }
+    ExpectSame(got, wanted);
 }
 
 // Linear sound of the ISO forms is read by the host itself where its depth is
