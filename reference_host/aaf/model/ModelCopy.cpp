@@ -155,7 +155,7 @@ HRESULT Model::CopyValue(const PropertyValue& source, Object& target,
                          PropertyDefinition& property) {
     RefPtr<PropertyValue> value = NewValue(*TypeLike(source.type()));
     CopyReferredTo(source);
-    value->bytes() = source.bytes();
+    value->BytesToChange() = source.bytes();
     value->SetStreamByteOrder(source.streamByteOrder());
     for (const RefPtr<Object>& object : source.objects()) {
         const RefPtr<Object> copy = CopyObject(*object);

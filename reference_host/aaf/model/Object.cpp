@@ -82,7 +82,7 @@ HRESULT Object::PutValue(PropertyId pid, PropertyValue* value) {
             return AAFRESULT_OBJECT_ALREADY_ATTACHED;
         }
         entering = value->type().NewValue();
-        entering->bytes() = value->bytes();
+        entering->BytesToChange() = value->bytes();
         entering->SetStreamByteOrder(value->streamByteOrder());
     }
     const HRESULT result = entering->EnterObject(*this);

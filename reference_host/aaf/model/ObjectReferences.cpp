@@ -177,7 +177,7 @@ HRESULT Object::PutWeak(const PropertyKey& key, IUnknown* target) {
     Bytes id;
     const HRESULT result = WeakKey(key, target, &id);
     if (result >= 0) {
-        RequireValue(key)->bytes() = std::move(id);
+        RequireValue(key)->BytesToChange() = std::move(id);
     }
     return result;
 }
@@ -186,7 +186,7 @@ HRESULT Object::AppendWeak(const PropertyKey& key, IUnknown* target) {
     Bytes id;
     const HRESULT result = WeakKey(key, target, &id);
     if (result >= 0) {
-        Bytes& ids = RequireValue(key)->bytes();
+        Bytes& ids = RequireValue(key)->BytesToChange();
         ids.insert(ids.end(), id.begin(), id.end());
     }
     return result;

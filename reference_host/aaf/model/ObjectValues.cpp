@@ -30,8 +30,8 @@ HRESULT Object::PutInteger(const PropertyKey& key, aafInt64 value) {
         return AAFRESULT_BAD_PROP;
     }
     const std::size_t size = stored->type().StoredSize();
-    stored->bytes().clear();
-    AppendNumber(static_cast<std::uint64_t>(value), size, stored->bytes());
+    stored->BytesToChange().clear();
+    AppendNumber(static_cast<std::uint64_t>(value), size, stored->BytesToChange());
     return AAFRESULT_SUCCESS;
 }
 
@@ -68,7 +68,7 @@ HRESULT Object::PutString(const PropertyKey& key, aafCharacter_constptr text) {
     if (value == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
-    value->bytes() = std::move(bytes);
+    value->BytesToChange() = std::move(bytes);
     return AAFRESULT_SUCCESS;
 }
 
@@ -108,7 +108,7 @@ HRESULT Object::PutNative(const PropertyKey& key, const void* data, std::size_t 
     Bytes stored;
     const HRESULT result = property->type()->Encode(data, bytes, stored);
     if (result >= 0) {
-        RequireValue(key)->bytes() = std::move(stored);
+        RequireValue(key)->BytesToChange() = std::move(stored);
     }
     return result;
 }
@@ -154,7 +154,7 @@ HRESULT Object::PutIndirect(const PropertyKey& key, IAAFTypeDef* type, const voi
     if (value == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
-    value->bytes() = std::move(stored);
+    value->BytesToChange() = std::move(stored);
     return AAFRESULT_SUCCESS;
 }
 

@@ -34,7 +34,8 @@ public:
     bool HoldsObjects() const;
 
     const Bytes& bytes() const { return bytes_; }
-    Bytes& bytes() {
+    // Tells the object that this value stands in: only for those who change it.
+    Bytes& BytesToChange() {
         TellHolder();
         return bytes_;
     }

@@ -43,8 +43,8 @@ HRESULT TypeCharacter::SetCharacter(IAAFPropertyValue* characterValue, aafCharac
     if (const HRESULT result = Take(characterValue, &value); result < 0) {
         return result;
     }
-    value->bytes().clear();
-    return Encode(&character, sizeof character, value->bytes());
+    value->BytesToChange().clear();
+    return Encode(&character, sizeof character, value->BytesToChange());
 }
 
 }  // namespace aaf

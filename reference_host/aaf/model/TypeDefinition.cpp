@@ -58,7 +58,7 @@ HRESULT TypeDefinition::Decode(const std::uint8_t* stored, std::size_t size, voi
 
 void TypeDefinition::FillEmpty(PropertyValue& value) const {
     const ValueForm valueForm = form();
-    value.bytes().assign(valueForm == ValueForm::Data ? StoredSize() : 0, 0);
+    value.BytesToChange().assign(valueForm == ValueForm::Data ? StoredSize() : 0, 0);
 }
 
 RefPtr<PropertyValue> TypeDefinition::NewValue() {
@@ -99,7 +99,7 @@ HRESULT TypeDefinition::Take(IAAFPropertyValue* argument, PropertyValue** value)
 HRESULT TypeDefinition::GiveValue(TypeDefinition& type, Bytes stored,
                                   IAAFPropertyValue** out) const {
     RefPtr<PropertyValue> value = type.NewValue();
-    value->bytes() = std::move(stored);
+    value->BytesToChange() = std::move(stored);
     return GiveOut(value.get(), out);
 }
 

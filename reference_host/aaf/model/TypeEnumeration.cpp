@@ -191,8 +191,8 @@ HRESULT TypeEnumeration::SetIntegerValue(IAAFPropertyValue* propValToSet, aafInt
     if (FindMember(valueIn) == nullptr) {
         return AAFRESULT_ILLEGAL_VALUE;
     }
-    value->bytes().clear();
-    AppendNumber(static_cast<std::uint64_t>(valueIn), StoredSize(), value->bytes());
+    value->BytesToChange().clear();
+    AppendNumber(static_cast<std::uint64_t>(valueIn), StoredSize(), value->BytesToChange());
     return AAFRESULT_SUCCESS;
 }
 

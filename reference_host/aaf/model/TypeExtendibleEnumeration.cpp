@@ -148,8 +148,8 @@ HRESULT TypeExtendibleEnumeration::SetAUIDValue(IAAFPropertyValue* propValToSet,
     if (FindMember(valueIn) == nullptr) {
         return AAFRESULT_ILLEGAL_VALUE;
     }
-    value->bytes().clear();
-    AppendGuid(valueIn, value->bytes());
+    value->BytesToChange().clear();
+    AppendGuid(valueIn, value->BytesToChange());
     return AAFRESULT_SUCCESS;
 }
 

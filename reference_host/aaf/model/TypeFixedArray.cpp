@@ -78,7 +78,7 @@ HRESULT TypeFixedArray::CreateValueFromValues(IAAFPropertyValue** elementValues,
         return AAFRESULT_ILLEGAL_VALUE;
     }
     RefPtr<PropertyValue> value = NewValue();
-    value->bytes().clear();
+    value->BytesToChange().clear();
     const HRESULT result = FillFromValues(*value, elementValues, numElements);
     return result < 0 ? result : GiveOut(value.get(), propVal);
 }
@@ -144,7 +144,7 @@ HRESULT TypeFixedArray::SetCArray(IAAFPropertyValue* propVal, aafMemPtr_t data,
     Bytes stored;
     const HRESULT result = Encode(data, dataSize, stored);
     if (result >= 0) {
-        value->bytes() = std::move(stored);
+        value->BytesToChange() = std::move(stored);
     }
     return result;
 }

@@ -178,7 +178,7 @@ HRESULT TypeOpaque::SetHandle(IAAFPropertyValue* propVal, aafUInt32 handleSize,
     if (handleSize < kIndirectHead) {
         return AAFRESULT_ILLEGAL_VALUE;
     }
-    value->bytes().assign(handle, handle + handleSize);
+    value->BytesToChange().assign(handle, handle + handleSize);
     return AAFRESULT_SUCCESS;
 }
 

@@ -139,7 +139,7 @@ HRESULT TypeInteger::SetInteger(IAAFPropertyValue* propVal, aafMemPtr_t val, aaf
     if (const HRESULT result = Take(propVal, &value); result < 0) {
         return result;
     }
-    return Widen(val, valSize, value->bytes());
+    return Widen(val, valSize, value->BytesToChange());
 }
 
 HRESULT TypeInteger::GetSize(aafUInt32* size) {

@@ -109,7 +109,7 @@ HRESULT TypeOfElements::GiveElement(const PropertyValue& value, std::size_t inde
     } else {
         const auto first =
             value.bytes().begin() + static_cast<std::ptrdiff_t>(index * ElementSize());
-        element->bytes().assign(first, first + static_cast<std::ptrdiff_t>(ElementSize()));
+        element->BytesToChange().assign(first, first + static_cast<std::ptrdiff_t>(ElementSize()));
     }
     return GiveOut(element.get(), out);
 }
@@ -154,8 +154,9 @@ HRESULT TypeOfElements::InsertElementAt(PropertyValue& value, std::size_t index,
         return value.InsertObject(index, element.objects().front().get());
     }
     const Bytes added = element.bytes();
-    value.bytes().insert(value.bytes().begin() + static_cast<std::ptrdiff_t>(index * ElementSize()),
-                         added.begin(), added.end());
+    value.BytesToChange().insert(
+        value.bytes().begin() + static_cast<std::ptrdiff_t>(index * ElementSize()), added.begin(),
+        added.end());
     return AAFRESULT_SUCCESS;
 }
 
@@ -168,7 +169,7 @@ HRESULT TypeOfElements::EraseElement(PropertyValue& value, std::size_t index) {
         return AAFRESULT_SUCCESS;
     }
     const auto first = value.bytes().begin() + static_cast<std::ptrdiff_t>(index * ElementSize());
-    value.bytes().erase(first, first + static_cast<std::ptrdiff_t>(ElementSize()));
+    value.BytesToChange().erase(first, first + static_cast<std::ptrdiff_t>(ElementSize()));
     return AAFRESULT_SUCCESS;
 }
 

@@ -270,9 +270,9 @@ HRESULT TypeRecord::SetValue(IAAFPropertyValue* propVal, aafUInt32 index,
     if (member == nullptr || member->bytes().size() != members_[index].type->StoredSize()) {
         return AAFRESULT_BAD_TYPE;
     }
-    value->bytes().resize(storedSize_);
+    value->BytesToChange().resize(storedSize_);
     std::copy(member->bytes().begin(), member->bytes().end(),
-              value->bytes().begin() + static_cast<std::ptrdiff_t>(StoredOffset(index)));
+              value->BytesToChange().begin() + static_cast<std::ptrdiff_t>(StoredOffset(index)));
     return AAFRESULT_SUCCESS;
 }
 
@@ -287,8 +287,8 @@ HRESULT TypeRecord::SetStruct(IAAFPropertyValue* propVal, aafMemPtr_t data, aafU
     if (const HRESULT result = CheckStruct(dataSize); result < 0) {
         return result;
     }
-    value->bytes().clear();
-    AppendStored(data, value->bytes());
+    value->BytesToChange().clear();
+    AppendStored(data, value->BytesToChange());
     return AAFRESULT_SUCCESS;
 }
 

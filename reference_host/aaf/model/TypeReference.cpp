@@ -144,8 +144,8 @@ HRESULT TypeWeakReference::Fill(PropertyValue& value, Unknown& object) {
     if (model()->FindTarget(targetClass(), id) == nullptr) {
         return AAFRESULT_OBJECT_NOT_ATTACHED;
     }
-    value.bytes().clear();
-    AppendGuid(id, value.bytes());
+    value.BytesToChange().clear();
+    AppendGuid(id, value.BytesToChange());
     return AAFRESULT_SUCCESS;
 }
 

@@ -37,7 +37,7 @@ HRESULT TypeStream::SetSize(IAAFPropertyValue* streamPropertyValue, aafInt64 new
     if (newSize < 0 || newSize > kLargestStream) {
         return AAFRESULT_BAD_SIZE;
     }
-    value->bytes().resize(static_cast<std::size_t>(newSize));
+    value->BytesToChange().resize(static_cast<std::size_t>(newSize));
     value->SetPosition(std::min<std::uint64_t>(value->position(), value->bytes().size()));
     return AAFRESULT_SUCCESS;
 }
@@ -95,8 +95,10 @@ HRESULT TypeStream::Write(IAAFPropertyValue* streamPropertyValue, aafUInt32 data
         return result;
     }
     const auto position = static_cast<std::size_t>(value->position());
-    value->bytes().resize(std::max<std::size_t>(value->bytes().size(), position + dataSize));
-    std::copy_n(data, dataSize, value->bytes().begin() + static_cast<std::ptrdiff_t>(position));
+    value->BytesToChange().resize(
+        std::max<std::size_t>(value->bytes().size(), position + dataSize));
+    std::copy_n(data, dataSize,
+                value->BytesToChange().begin() + static_cast<std::ptrdiff_t>(position));
     value->SetPosition(position + dataSize);
     return AAFRESULT_SUCCESS;
 }

@@ -100,7 +100,7 @@ HRESULT TypeString::SetCString(IAAFPropertyValue* propVal, aafMemPtr_t data, aaf
     Bytes stored;
     const HRESULT result = Encode(data, dataSize, stored);
     if (result >= 0) {
-        value->bytes() = std::move(stored);
+        value->BytesToChange() = std::move(stored);
     }
     return result;
 }
@@ -121,7 +121,7 @@ HRESULT TypeString::AppendElements(IAAFPropertyValue* inPropVal, aafMemPtr_t ele
         }
         text.push_back(character);
     }
-    value->bytes() = StoredText(text);
+    value->BytesToChange() = StoredText(text);
     return AAFRESULT_SUCCESS;
 }
 

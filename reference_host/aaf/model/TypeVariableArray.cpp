@@ -139,7 +139,7 @@ HRESULT TypeVariableArray::SetCArray(IAAFPropertyValue* propVal, aafMemPtr_t dat
     Bytes stored;
     const HRESULT result = Encode(data, dataSize, stored);
     if (result >= 0) {
-        value->bytes() = std::move(stored);
+        value->BytesToChange() = std::move(stored);
     }
     return result;
 }

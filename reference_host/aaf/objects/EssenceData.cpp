@@ -54,7 +54,7 @@ HRESULT EssenceData::Write(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* b
     }
     PropertyValue* const stream = RequireValue(prop::EssenceData_Data);
     const auto at = static_cast<std::size_t>(stream->position());
-    Bytes& content = stream->bytes();
+    Bytes& content = stream->BytesToChange();
     if (content.size() < at + bytes) {
         content.resize(at + bytes);
     }

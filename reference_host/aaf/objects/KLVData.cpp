@@ -34,7 +34,7 @@ HRESULT KLVData::Initialize(aafUID_t key, aafUInt32 length, aafDataBuffer_t valu
     bytes[0] = kLittleEndian;
     std::memcpy(&bytes[kKeyAt], &key, sizeof key);
     std::copy_n(value, length, bytes.begin() + kBytesAt);
-    RequireValue(prop::KLVData_Value)->bytes() = std::move(bytes);
+    RequireValue(prop::KLVData_Value)->BytesToChange() = std::move(bytes);
     return AAFRESULT_SUCCESS;
 }
 
@@ -88,8 +88,8 @@ HRESULT KLVData::SetValue(aafUInt32 valueSize, aafDataBuffer_t value) {
     if (stored == nullptr) {
         return AAFRESULT_NOT_INITIALIZED;
     }
-    stored->bytes().resize(kBytesAt);
-    stored->bytes().insert(stored->bytes().end(), value, value + valueSize);
+    stored->BytesToChange().resize(kBytesAt);
+    stored->BytesToChange().insert(stored->bytes().end(), value, value + valueSize);
     return AAFRESULT_SUCCESS;
 }
 

@@ -93,12 +93,12 @@ private:
         switch (from.form) {
             case StoredForm::Data:
             case StoredForm::Stream:
-                value->bytes() = from.bytes;
+                value->BytesToChange() = from.bytes;
                 break;
             case StoredForm::WeakReference:
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                value->bytes() = targets(from);
+                value->BytesToChange() = targets(from);
                 break;
             case StoredForm::StrongReference:
             case StoredForm::StrongVector:

@@ -4,6 +4,14 @@
 
 namespace {
 
+// Counts how often it was told of a change.
+class WatchedObject final : public aaf::Object {
+public:
+    int changes = 0;
+    void OnValueChange(const aaf::PropertyValue&) override { ++changes; }
+};
+constexpr aaf::ClassEntry kWatched[] = {{AUID_AAFCDCIDescriptor, &aaf::CreateAs<WatchedObject>}};
+
 class ObjectValues : public ModelFixture {
 protected:
     aaf::RefPtr<aaf::Object> picture = model->NewObject<aaf::Object>(AUID_AAFCDCIDescriptor);
@@ -178,6 +186,38 @@ TEST_F(ObjectValues, PropertiesWithoutAFixedNumberAreFoundById) {
     EXPECT_GE(mpeg->values().begin()->first, 0x8000);
     // An object of another class has no such property, and none with the number 0.
     EXPECT_FALSE(picture->IsPresent(aaf::prop::MPEGVideoDescriptor_BitRate));
+}
+
+// A mob that is told of a change forgets where its slots lie, and looks for
+// them anew.
+TEST(WatchedValues, AreNotChangedByReadingThem) {
+    aaf::ClassRegistry registry;
+    registry.Add(kWatched);
+    const auto model = aaf::Model::Create(registry);
+    const auto object = model->NewObject<WatchedObject>(AUID_AAFCDCIDescriptor);
+    ASSERT_TRUE(object);
+    ASSERT_EQ(object->PutInteger(aaf::prop::FileDescriptor_Length, 7), AAFRESULT_SUCCESS);
+    const int before = object->changes;
+    EXPECT_GT(before, 0);
+
+    aaf::PropertyValue* const value = object->FindValue(aaf::prop::FileDescriptor_Length);
+    IAAFTypeDef* type = nullptr;
+    ASSERT_EQ(value->GetType(&type), AAFRESULT_SUCCESS);
+    const auto holder = aaf::RefPtr<IAAFTypeDef>::Adopt(type);
+    void* found = nullptr;
+    ASSERT_EQ(type->QueryInterface(aafIdOf(static_cast<const IAAFTypeDefRename*>(nullptr)), &found),
+              AAFRESULT_SUCCESS);
+    const auto rename =
+        aaf::RefPtr<IAAFTypeDefRename>::Adopt(static_cast<IAAFTypeDefRename*>(found));
+    IAAFPropertyValue* base = nullptr;
+    ASSERT_EQ(rename->GetBaseValue(value, &base), AAFRESULT_SUCCESS);
+    aaf::RefPtr<IAAFPropertyValue>::Adopt(base);
+    aafInt64 length = 0;
+    EXPECT_EQ(object->ReadInteger(aaf::prop::FileDescriptor_Length, &length), AAFRESULT_SUCCESS);
+    EXPECT_EQ(object->changes, before);
+
+    ASSERT_EQ(object->PutInteger(aaf::prop::FileDescriptor_Length, 8), AAFRESULT_SUCCESS);
+    EXPECT_GT(object->changes, before);
 }
 
 }  // namespace

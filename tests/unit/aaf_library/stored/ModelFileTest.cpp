@@ -192,7 +192,7 @@ TEST(ModelFile, EssenceIsKeptAsAStream) {
     const RefPtr<Object> essence =
         sample.model->CreateObject(*sample.model->FindClass(AUID_AAFEssenceData));
     ASSERT_GE(essence->PutStruct(prop::EssenceData_MobID, sample::mobId(5)), 0);
-    essence->RequireValue(prop::EssenceData_Data)->bytes() = Bytes(700000, 0x2E);
+    essence->RequireValue(prop::EssenceData_Data)->BytesToChange() = Bytes(700000, 0x2E);
     Object* content = sample.header->ObjectAt(prop::Header_Content);
     ASSERT_GE(content->AddToSet(prop::ContentStorage_EssenceData, essence->Identity()), 0);
     for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {

@@ -181,8 +181,8 @@ private:
         Unknown* container = model_->FindTarget(AUID_AAFContainerDef, aafContainerId);
         must(object->PutWeak(prop::FileDescriptor_ContainerFormat, container->Identity()));
         PropertyValue* area = object->RequireValue(model_->FindProperty(quadPropertyId)->key());
-        area->bytes() = {0,   0, 0, 0, 1, 0, 0, 0, 0,  0, 0, 0, 1, 0, 0, 0,
-                         128, 7, 0, 0, 1, 0, 0, 0, 56, 4, 0, 0, 1, 0, 0, 0};
+        area->BytesToChange() = {0,   0, 0, 0, 1, 0, 0, 0, 0,  0, 0, 0, 1, 0, 0, 0,
+                                 128, 7, 0, 0, 1, 0, 0, 0, 56, 4, 0, 0, 1, 0, 0, 0};
         return object;
     }
 
@@ -196,7 +196,8 @@ private:
         must(locator->PutString(prop::NetworkLocator_URLString, L"file:///clip.mov"));
         must(descriptor->AppendObject(prop::EssenceDescriptor_Locator, id(locator)));
         RefPtr<Object> own = make(ownClassId);
-        own->RequireValue(model_->FindProperty(ownPropertyId)->key())->bytes() = Bytes(24, 3);
+        own->RequireValue(model_->FindProperty(ownPropertyId)->key())->BytesToChange() =
+            Bytes(24, 3);
         must(descriptor->AppendObject(prop::EssenceDescriptor_Locator, id(own)));
         must(object->PutObject(prop::SourceMob_EssenceDescription, id(descriptor)));
         must(object->AppendObject(
