@@ -23,14 +23,24 @@ void NMAXmlElement::SetChanged() {
     rebuildAttributeIndex();
 }
 
+// Only children that are new to their place are looked at, so building a long
+// list costs one look at each.
 void NMAXmlElement::rebuildAttributeIndex() {
+    found_.reset();
+    while (!attributePlaces_.empty() && attributePlaces_.back() >= standing_) {
+        attributePlaces_.pop_back();
+    }
+    for (; standing_ < children_.size(); ++standing_) {
+        if (dynamic_cast<NMAXmlAttribute*>(children_[standing_])) {
+            attributePlaces_.push_back(standing_);
+        }
+    }
     attributeIndex_.clear();
-    for (std::size_t i = 0; i < children_.size(); ++i) {
-        auto* const attribute = dynamic_cast<NMAXmlAttribute*>(children_[i]);
-        if (attribute && attribute->GetState() != kDeleted) {
+    for (const std::size_t place : attributePlaces_) {
+        if (children_[place]->GetState() != kDeleted) {
             NMAString name;
-            attribute->GetNodeName(name);
-            attributeIndex_.emplace(name.GetUTF8String(), i);
+            children_[place]->GetNodeName(name);
+            attributeIndex_.emplace(name.GetUTF8String(), place);
         }
     }
 }
@@ -95,6 +105,9 @@ void NMAXmlElement::SetTagName(const NMAString& name) {
         ThrowIfFailed(NCF_E_UNEXPECTED);
     }
     tagName_ = name;
+    if (auto* const parent = dynamic_cast<NMAXmlElement*>(parent_)) {
+        parent->found_.reset();
+    }
 }
 
 void NMAXmlElement::GetText(NMAString& out) {

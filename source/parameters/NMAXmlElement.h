@@ -3,6 +3,7 @@
 #pragma once
 
 #include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -89,9 +90,19 @@ private:
     void collect(const NMAString& name, Wanted wanted, std::vector<NMAXmlElement*>& out);
     template <class Wanted>
     void remove(const NMAString& name, Wanted wanted);
+    static bool isNamed(NMAXmlElement& element, const NMAString& name);
     void rebuildAttributeIndex();
 
     std::map<std::string, std::size_t> attributeIndex_;  // name to place in the list
+    std::vector<std::size_t> attributePlaces_;           // of all of them in the list
+    // The child that FindChild gave last: going through all by their indexes
+    // steps from one to the next. Forgotten with every change.
+    struct Found {
+        NMAString name;
+        ncfUInt32 index;
+        std::size_t place;
+    };
+    std::optional<Found> found_;
     NMAString tagName_;
 };
 

@@ -53,18 +53,19 @@ ncfUInt32 SizeOf(const std::vector<NMAXmlElement*>& found) {
 
 }  // namespace
 
+bool NMAXmlElement::isNamed(NMAXmlElement& element, const NMAString& name) {
+    NMAString tag;
+    element.GetTagName(tag);
+    return name.IsEmpty() || tag == name;
+}
+
 template <class Wanted>
 void NMAXmlElement::collect(const NMAString& name, Wanted wanted,
                             std::vector<NMAXmlElement*>& out) {
     LoadChildren();
     for (NMAXmlNode* child : children_) {
         auto* const element = dynamic_cast<NMAXmlElement*>(child);
-        if (!element) {
-            continue;
-        }
-        NMAString tag;
-        element->GetTagName(tag);
-        if ((name.IsEmpty() || tag == name) && wanted(*element)) {
+        if (element && isNamed(*element, name) && wanted(*element)) {
             out.push_back(element);
         }
     }
@@ -94,9 +95,21 @@ ncfUInt32 NMAXmlElement::CountChildren(const NMAString& name) {
 }
 
 NMAXmlElement* NMAXmlElement::FindChild(const NMAString& name, ncfUInt32 index) {
-    std::vector<NMAXmlElement*> found;
-    collect(name, AnyElement, found);
-    return At(found, index);
+    LoadChildren();
+    const bool goesOn = found_ && found_->index <= index && found_->name == name;
+    ncfUInt32 matches = goesOn ? found_->index : 0;
+    for (std::size_t place = goesOn ? found_->place : 0; place < children_.size(); ++place) {
+        auto* const element = dynamic_cast<NMAXmlElement*>(children_[place]);
+        if (!element || !isNamed(*element, name)) {
+            continue;
+        }
+        if (matches == index) {
+            found_ = Found{name, index, place};
+            return element;
+        }
+        ++matches;
+    }
+    return nullptr;
 }
 
 void NMAXmlElement::CollectChildren(const NMAString& name, std::vector<NMAXmlElement*>& out) {

@@ -54,6 +54,12 @@ void NMAXmlNode::deleteChildren() {
         delete child;
     }
     children_.clear();
+    standing_ = 0;
+}
+
+void NMAXmlNode::eraseChildAt(std::size_t index) {
+    children_.erase(children_.begin() + static_cast<std::ptrdiff_t>(index));
+    standing_ = std::min(standing_, index);
 }
 
 NMAXmlNode* NMAXmlNode::Wrap(IXmlNode* hostNode) {
@@ -158,7 +164,7 @@ void NMAXmlNode::AddChild(NMAXmlNode* node) {
         ThrowIfFailed(NCF_E_INVALIDARG);
     }
     LoadChildren();
-    if (findHostChild(node->HostNode()) < children_.size()) {
+    if (node->HostNode() && findHostChild(node->HostNode()) < children_.size()) {
         ThrowIfFailed(NCF_E_UNEXPECTED);
     }
     node->parent_ = this;
@@ -167,7 +173,7 @@ void NMAXmlNode::AddChild(NMAXmlNode* node) {
         SetChanged();
     } catch (...) {
         // The node is still the caller's to delete.
-        children_.pop_back();
+        eraseChildAt(children_.size() - 1);
         node->parent_ = nullptr;
         throw;
     }
@@ -197,7 +203,7 @@ void NMAXmlNode::RemoveChild(NMAXmlNode* node) {
     LoadChildren();
     const auto found = std::find(children_.begin(), children_.end(), node);
     if (found != children_.end()) {
-        children_.erase(found);
+        eraseChildAt(static_cast<std::size_t>(found - children_.begin()));
         SetChanged();
     }
 }
@@ -229,7 +235,7 @@ void NMAXmlNode::DiscardNewChildren() {
     for (std::size_t i = 0; i < children_.size();) {
         if (children_[i]->origin_ == kOriginMemory) {
             delete children_[i];
-            children_.erase(children_.begin() + static_cast<std::ptrdiff_t>(i));
+            eraseChildAt(i);
         } else {
             children_[i]->DiscardNewChildren();
             ++i;
@@ -241,7 +247,7 @@ void NMAXmlNode::DiscardNewChildren() {
 void NMAXmlNode::DropChildAt(std::size_t index) {
     NMAXmlNode* const child = children_[index];
     if (child->origin_ == kOriginMemory) {
-        children_.erase(children_.begin() + static_cast<std::ptrdiff_t>(index));
+        eraseChildAt(index);
         delete child;
     } else {
         child->MarkDeleted();

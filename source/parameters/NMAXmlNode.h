@@ -85,6 +85,8 @@ protected:
 
     NCFSmartPtr<IXmlNode> hostNode_;
     std::vector<NMAXmlNode*> children_;  // owned
+    // How many of the first children stand where a derived class last saw them.
+    std::size_t standing_ = 0;
     ncfUInt32 origin_;
     ncfUInt32 state_;
     NMAXmlNode* parent_ = nullptr;
@@ -92,6 +94,7 @@ protected:
 private:
     void deleteChildren();
     void appendWrapped(IXmlNode* hostChild);
+    void eraseChildAt(std::size_t index);
     std::size_t findHostChild(IXmlNode* hostNode) const;
 };
 

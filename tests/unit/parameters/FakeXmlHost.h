@@ -39,7 +39,7 @@ protected:
 };
 
 // A node of a host document that refuses what it is told to and counts how
-// often its children are asked for. The test owns the tree; references are
+// often its children and its tag are asked for. The test owns the tree; references are
 // counted, not obeyed.
 class FakeXmlNode final : public IXmlNode, public Refusals {
 public:
@@ -61,6 +61,7 @@ public:
 
     int references = 0;
     int childQuestions = 0;
+    int tagQuestions = 0;
 
     NCFRESULT QueryInterface(const GUID& iid, void** out) override {
         *out = nullptr;
@@ -121,6 +122,7 @@ private:
     public:
         using Face::Face;
         NCFRESULT GetTagName(INCFString** out) override {
+            ++node_->tagQuestions;
             return node_->GiveText("GetTagName", node_->name_, out);
         }
     };

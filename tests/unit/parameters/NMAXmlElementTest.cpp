@@ -32,6 +32,50 @@ TEST_F(XmlElement, FindsChildrenByNameInOrder) {
     EXPECT_EQ(found.size(), 2u);
 }
 
+TEST_F(XmlElement, FindsChildrenByIndexesInAnyOrderAndAfterChanges) {
+    doc.CreateRoot(S("a"));
+    Element* const root = doc.GetRoot();
+    for (const char* const text : {"0", "1", "2", "3"}) {
+        root->AddChildElementWithText(S("b"), S(text));
+        root->AddChildElementWithText(S("c"), S("c"));
+    }
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "2");
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 3)), "3");
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 0)), "0");
+    EXPECT_EQ(TextOf(root->FindChild(S(""), 2)), "1") << "another name counts anew";
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "2");
+    // In front of the one found last a match goes, then one comes.
+    Element* const first = root->FindChild(S("b"), 0);
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "2");
+    root->RemoveChild(first);
+    delete first;
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "3");
+    root->FindChild(S("c"), 0)->SetTagName(S("b"));
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "2");
+}
+
+// Attributes may stand behind other children, which come and go.
+TEST_F(XmlElement, KnowsItsAttributesWhereverTheyStand) {
+    doc.CreateRoot(S("a"));
+    Element* const root = doc.GetRoot();
+    root->AddText(S("text"));
+    root->SetAttribute(S("x"), S("1"));
+    root->AddChildElement(S("b"), nullptr);
+    root->SetAttribute(S("y"), S("2"));
+    EXPECT_EQ(AttributeOf(root, "y"), "2");
+    root->SetText(S("other"));  // the first child goes, all others move
+    EXPECT_EQ(AttributeOf(root, "x"), "1");
+    EXPECT_EQ(AttributeOf(root, "y"), "2");
+    root->RemoveChildren(S("b"));
+    root->SetAttribute(S("y"), S("3"));
+    EXPECT_EQ(AttributeOf(root, "y"), "3");
+    root->RemoveAttribute(S("x"));
+    EXPECT_FALSE(root->HasAttribute(S("x")));
+    std::vector<NMAXmlNode*> attributes;
+    root->GetAttributes(attributes);
+    EXPECT_EQ(attributes.size(), 2u) << "deleted ones stay in the list";
+}
+
 TEST_F(XmlElement, EmptyNameFindsElementsOnly) {
     Element* const root = load("<a x=\"1\">text<b/>more<c/></a>");
     EXPECT_EQ(root->CountChildren(S("")), 2u);

@@ -46,6 +46,27 @@ protected:
     std::unique_ptr<Doc> doc = std::make_unique<Doc>(host.factory());
 };
 
+// Going through all children by their indexes asks each for its tag twice at
+// most: once when it is stepped to, once when it is stepped from.
+TEST_F(XmlHostRefusals, StepsFromChildToChild) {
+    constexpr int kCount = 200;
+    std::vector<FakeXmlNode*> children;
+    for (int i = 0; i < kCount; ++i) {
+        children.push_back(&root.AddElement(i % 2 == 0 ? "even" : "odd"));
+    }
+    Element* const element = Load();
+    ncfUInt32 found = 0;
+    while (element->FindChild(S("even"), found)) {
+        ++found;
+    }
+    EXPECT_EQ(found, kCount / 2u);
+    int questions = 0;
+    for (const FakeXmlNode* one : children) {
+        questions += one->tagQuestions;
+    }
+    EXPECT_LE(questions, 2 * kCount);
+}
+
 // --- loading ----------------------------------------------------------------------
 
 TEST_F(XmlHostRefusals, EveryRefusedStepOfLoadingIsThrown) {
