@@ -13,12 +13,41 @@ namespace {
 // Largest range that one read can fetch.
 constexpr ncfUInt64 kLargestRead = 0xFFFFFFFF;
 
+// A long range is read in pieces of this size: the reader holds what it reads a
+// second time.
+constexpr ncfUInt32 kPiece = 8 * kHashChunkSize;
+
+// Whether pieces come out as one read would.
+bool IsInside(NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt32 size) {
+    ncfUInt64 length = 0;
+    return file_reader.GetLength(&length) >= 0 && offset <= length && size <= length - offset;
+}
+
 NCFRESULT ReadWhole(const char* ncfFunction, const char* statement,
                     NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt32 size,
                     ncfUInt8* bytes) {
-    ncfUInt32 actualRead = 0;
-    NCF_RETURN_TEXT(statement, file_reader.Read(offset, bytes, size, &actualRead));
-    return actualRead == size ? NCF_OK : NCF_E_FAIL;
+    const bool inPieces = size > kPiece && IsInside(file_reader, offset, size);
+    const ncfUInt32 most = inPieces ? kPiece : size;
+    for (ncfUInt32 done = 0; done < size;) {
+        const ncfUInt32 wanted = std::min(most, size - done);
+        ncfUInt32 actualRead = 0;
+        NCF_RETURN_TEXT(statement,
+                        file_reader.Read(offset + done, bytes + done, wanted, &actualRead));
+        if (actualRead != wanted) {
+            return NCF_E_FAIL;
+        }
+        done += wanted;
+    }
+    return NCF_OK;
+}
+
+// Room behind the first range, which is the movie header, for what tracks add.
+// A long header must not be moved for them: twice its size would be held.
+constexpr std::size_t kRoomForTracks = 4 * kHashChunkSize;
+
+std::size_t NextCapacity(const std::vector<ncfUInt8>& content, std::size_t needed) {
+    return content.empty() ? needed + needed / 4 + kRoomForTracks
+                           : std::max(needed, 2 * content.capacity());
 }
 
 // How much of the content is good, however the reading ends.
@@ -42,10 +71,10 @@ NCFRESULT AppendFileRange(const char* function, const char* statement,
     }
     const auto wanted = static_cast<ncfUInt32>(size);
     Kept kept{content, content.size()};
-    // The first range gets its room exactly; from then on it doubles, since a
-    // movie of many tracks must not move everything for each of them.
+    // Room that nothing is written to costs nothing. When it is used up it
+    // doubles, since a movie of many tracks must not move everything for each.
     if (const std::size_t needed = kept.size + wanted; needed > content.capacity()) {
-        content.reserve(std::max(needed, 2 * content.capacity()));
+        content.reserve(NextCapacity(content, needed));
     }
     os::ExpectLargeBlock(content.data() + kept.size, wanted);
     content.resize(kept.size + wanted);

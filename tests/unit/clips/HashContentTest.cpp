@@ -53,3 +53,58 @@ TEST_F(HashContent, MovesItsContentSeldom) {
     EXPECT_EQ(content.size(), 1000003u);
     EXPECT_LE(moves, 20);
 }
+
+namespace {
+
+// A file of many mebibytes, with a mark in each.
+class LongHashContent : public ClipTest {
+protected:
+    static constexpr ncfUInt64 kMebibyte = 1 << 20;
+    static std::vector<ncfUInt8> Marked(std::size_t mebibytes) {
+        std::vector<ncfUInt8> bytes(mebibytes * kMebibyte);
+        for (std::size_t i = 0; i < mebibytes; ++i) {
+            bytes[i * kMebibyte] = bytes[(i + 1) * kMebibyte - 1] = static_cast<ncfUInt8>(i + 1);
+        }
+        return bytes;
+    }
+    LongHashContent() : ClipTest(Marked(24)) {}
+    NCFRESULT Append(ncfUInt64 offset, ncfUInt64 size) {
+        return AppendFileRange("Reader", "read it", reader, offset, size, content);
+    }
+
+    NMA::Impl::SimpleFileIO reader{HostText(file.path()).inArg()};
+    std::vector<ncfUInt8> content;
+};
+
+TEST_F(LongHashContent, ComesOutWholeWhereverItBegins) {
+    const std::vector<ncfUInt8> whole = Marked(24);
+    EXPECT_EQ(Append(0, whole.size()), NCF_OK);
+    EXPECT_TRUE(content == whole);
+    content.clear();
+    EXPECT_EQ(Append(777, whole.size() - 1777), NCF_OK);
+    EXPECT_TRUE(std::equal(content.begin(), content.end(), whole.begin() + 777));
+    EXPECT_EQ(content.size(), whole.size() - 1777);
+}
+
+// As short as any other read, wherever the file ends.
+TEST_F(LongHashContent, LeavesNothingOfARangeThatTheFileCannotFill) {
+    RecordingNMALog lines(1);
+    for (const ncfUInt64 offset : {ncfUInt64{1}, 8 * kMebibyte, 16 * kMebibyte}) {
+        EXPECT_EQ(Append(offset, 24 * kMebibyte), NCF_E_FAIL) << offset;
+    }
+    EXPECT_TRUE(content.empty());
+    EXPECT_TRUE(log->records().empty());
+    EXPECT_TRUE(lines.lines().empty());
+}
+
+// Tracks add a mebibyte each.
+TEST_F(LongHashContent, IsNotMovedForAFewTracks) {
+    EXPECT_EQ(Append(0, 24 * kMebibyte), NCF_OK);
+    const ncfUInt8* const former = content.data();
+    for (int i = 0; i < 8; ++i) {
+        ASSERT_EQ(Append(0, kMebibyte), NCF_OK);
+    }
+    EXPECT_EQ(content.data(), former);
+}
+
+}  // namespace
