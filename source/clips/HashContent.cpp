@@ -15,7 +15,7 @@ constexpr ncfUInt64 kLargestRead = 0xFFFFFFFF;
 
 // A long range is read in pieces of this size: the reader holds what it reads a
 // second time.
-constexpr ncfUInt32 kPiece = 8 * kHashChunkSize;
+constexpr ncfUInt32 kPiece = 4 * kHashChunkSize;
 
 // Whether pieces come out as one read would.
 bool IsInside(NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt32 size) {

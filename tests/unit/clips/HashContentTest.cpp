@@ -89,7 +89,7 @@ TEST_F(LongHashContent, ComesOutWholeWhereverItBegins) {
 // As short as any other read, wherever the file ends.
 TEST_F(LongHashContent, LeavesNothingOfARangeThatTheFileCannotFill) {
     RecordingNMALog lines(1);
-    for (const ncfUInt64 offset : {ncfUInt64{1}, 8 * kMebibyte, 16 * kMebibyte}) {
+    for (const ncfUInt64 offset : {kMebibyte, 8 * kMebibyte, 16 * kMebibyte}) {
         EXPECT_EQ(Append(offset, 24 * kMebibyte), NCF_E_FAIL) << offset;
     }
     EXPECT_TRUE(content.empty());
