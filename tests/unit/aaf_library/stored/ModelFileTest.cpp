@@ -287,7 +287,7 @@ TEST(ModelFile, ADefinitionThatTheDictionaryLacksIsRefused) {
     const sample::SampleModel sample = sample::wholeModel();
     Object& import = sample::mob(*sample.header, 1);
     Object* timecode = sample::slot(import, 0).ObjectAt(prop::MobSlot_Segment);
-    timecode->FindValue(prop::Component_DataDefinition)->bytes()[0] ^= 0xFF;
+    timecode->FindValue(prop::Component_DataDefinition)->BytesToChange()[0] ^= 0xFF;
     EXPECT_EQ(refusal(sample),
               "a definition that is referred to is not in the dictionary (property 2605)");
 }
