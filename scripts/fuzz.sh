@@ -21,15 +21,13 @@ mapfile -t targets < <(find "$build/fuzz" -maxdepth 1 -type f -executable -name 
 ((${#targets[@]})) || { echo "no fuzz target '$wanted' in $build"; exit 2; }
 mkdir -p "$logs" "$findings"
 
-cut=$build/seeds
-rm -rf "$cut"
-mkdir -p "$cut"
+cut=$(mktemp -d)
 if [ -n "$seeds" ]; then "$build/cut_seeds" "$seeds" "$cut"; fi
 
 before=$(mktemp)
 ls "$findings" >"$before"
 running=()
-stop() { kill "${running[@]}" 2>/dev/null || true; rm -f "$before"; }
+stop() { kill "${running[@]}" 2>/dev/null || true; rm -rf "$before" "$cut"; }
 trap stop EXIT
 for target in "${targets[@]}"; do
   name=$(basename "$target")

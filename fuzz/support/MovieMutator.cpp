@@ -4,6 +4,7 @@
 // Changes to movies: most of them in the header, which is where movies differ
 // and a small part of a file.
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
@@ -63,7 +64,7 @@ extern "C" std::size_t LLVMFuzzerCustomMutator(std::uint8_t* data, std::size_t s
     const std::vector<std::uint8_t> rest(data + header->end, data + size);
     const std::size_t length =
         LLVMFuzzerMutate(data + body, header->end - body, most - body - rest.size());
-    std::memcpy(data + body + length, rest.data(), rest.size());
+    std::copy(rest.begin(), rest.end(), data + body + length);
     SetSize(data + header->begin, length + 8);
     return body + length + rest.size();
 }
