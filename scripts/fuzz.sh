@@ -37,6 +37,7 @@ for target in "${targets[@]}"; do
   mkdir -p "$work"
   arguments=(-fork=1 -ignore_crashes=1 -ignore_ooms=1 -ignore_timeouts=1
     -max_total_time=$((minutes * 60)) -timeout=$most_seconds_on_the_wall
+    -report_slow_units=$most_seconds_on_the_wall
     -rss_limit_mb=$most_megabytes -malloc_limit_mb=$most_megabytes -max_len=$largest_input
     -artifact_prefix="$findings/$name-")
   [ -z "$words" ] || arguments+=(-dict="fuzz/dictionaries/$words.dict")
