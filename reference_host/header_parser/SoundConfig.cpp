@@ -11,19 +11,14 @@ namespace header_parser {
 
 namespace {
 
-using Open = SoundDescription::Open;
-
 // What comes out; 0 for what is not told.
 struct Told {
     ncfUInt32 channels = 0;
     ncfUInt32 rate = 0;
-    Open open = Open::kNothing;
-    Atom config;  // where it was found
 };
 
 // Kinds of AAC by number.
 enum ObjectType : ncfUInt32 {
-    kLowComplexity = 2,
     kSpectralBands = 5,      // doubles the rate of its core
     kParametricStereo = 29,  // the same, and makes two channels of one
     kEscape = 31,
@@ -63,7 +58,7 @@ ncfUInt32 TakeProgramChannels(BitReader& bits) {
     return bits.Failed() ? 0 : channels;
 }
 
-// Whether packets hold an extension.
+// Whether packets hold an extension, as far as is told.
 enum class Extension { kUntold, kNo, kYes };
 
 // The configuration of AAC. Extensions are announced in front, in the place of
@@ -72,7 +67,7 @@ enum class Extension { kUntold, kNo, kYes };
 Told ReadAacConfig(const Atom& config) {
     constexpr ncfUInt32 kChannels[] = {0, 1, 2, 3, 4, 5, 6, 8, 0, 0, 0, 7, 8, 24, 8, 0};
     BitReader bits(config.begin, config.end);
-    ncfUInt32 type = TakeObjectType(bits);
+    const ncfUInt32 type = TakeObjectType(bits);
     const ncfUInt32 rate = TakeAacRate(bits);
     const ncfUInt32 arrangement = bits.Take(4);
     Extension bands = Extension::kUntold;
@@ -81,10 +76,9 @@ Told ReadAacConfig(const Atom& config) {
     if (type == kSpectralBands || type == kParametricStereo) {
         bands = Extension::kYes;
         extendedRate = TakeAacRate(bits);
-        type = TakeObjectType(bits);
+        TakeObjectType(bits);
     }
     Told told;
-    told.config = config;
     told.channels = kChannels[arrangement];
     if (arrangement == 0) {
         BitReader program = bits;
@@ -121,8 +115,6 @@ Told ReadAacConfig(const Atom& config) {
     if (told.channels == 1 && bands == Extension::kYes && stereo != Extension::kNo) {
         told.channels = 2;
     }
-    const bool mayHoldMore = bands == Extension::kUntold && type == kLowComplexity;
-    told.open = mayHoldMore ? Open::kAac : Open::kNothing;
     return told;
 }
 
@@ -188,10 +180,6 @@ Told ReadStreamConfig(const Atom& esds) {
     const Atom config = hasConfig ? Atom{Code("esds"), reader.At(), reader.End()} : Atom();
     Told told;
     switch (kind) {
-        case 0x69:  // layers 1 to 3 of either MPEG
-        case 0x6B:
-            told.open = Open::kMpegAudio;
-            return told;
         case 0x40:
         case 0x66:
         case 0x67:
@@ -283,19 +271,10 @@ struct ConfigRow {
 };
 
 const ConfigRow kRows[] = {
-    {Code("mp4a"), Code("esds"), ReadStreamConfig},
-    {Code("Opus"), Code("dOps"), ReadOpusConfig},
-    {Code("ac-3"), Code("dac3"), ReadAc3Config},
-    {Code("ec-3"), Code("dec3"), ReadEac3Config},
-    {Code("fLaC"), Code("dfLa"), ReadFlacConfig},
-    {Code("alac"), Code("alac"), ReadAlacConfig},
-    {Code("samr"), 0, ReadNothing, {1, 8000, Open::kNothing, {}}},
-    {Code("sawb"), 0, ReadNothing, {1, 16000, Open::kNothing, {}}},
-    {Code(".mp3"), 0, ReadNothing, {0, 0, Open::kMpegAudio, {}}},
-    {Code(".mp2"), 0, ReadNothing, {0, 0, Open::kMpegAudio, {}}},
-    {Code(".mp1"), 0, ReadNothing, {0, 0, Open::kMpegAudio, {}}},
-    {0x6D730055, 0, ReadNothing, {0, 0, Open::kMpegAudio, {}}},  // as in AVI: layer 3
-    {0x6D730050, 0, ReadNothing, {0, 0, Open::kMpegAudio, {}}},  // layers 1 and 2
+    {Code("mp4a"), Code("esds"), ReadStreamConfig}, {Code("Opus"), Code("dOps"), ReadOpusConfig},
+    {Code("ac-3"), Code("dac3"), ReadAc3Config},    {Code("ec-3"), Code("dec3"), ReadEac3Config},
+    {Code("fLaC"), Code("dfLa"), ReadFlacConfig},   {Code("alac"), Code("alac"), ReadAlacConfig},
+    {Code("samr"), 0, ReadNothing, {1, 8000}},      {Code("sawb"), 0, ReadNothing, {1, 16000}},
 };
 
 Atom FindConfig(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt32 type) {
@@ -322,9 +301,6 @@ void ReadSoundConfig(ncfUInt32 codec, const ncfUInt8* begin, const ncfUInt8* end
     if (told.rate != 0 && told.rate <= kHighestRate) {
         description.rate = told.rate;
     }
-    description.open = told.open;
-    description.configBegin = told.config.begin;
-    description.configEnd = told.config.end;
 }
 
 }  // namespace header_parser

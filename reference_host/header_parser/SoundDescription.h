@@ -19,15 +19,6 @@ struct SoundDescription {
     bool isConstantBitRate = false;
     ncfUInt32 bytesPerPacket = 0;  // all channels; 0 when it varies
     ncfUInt32 framesPerPacket = 1;
-    // What the header leaves open of channels and rate.
-    enum class Open {
-        kNothing,
-        kMpegAudio,  // the first packet's own header tells both
-        kAac,        // the first packet tells whether what it holds is extended
-    } open = Open::kNothing;
-    // The decoder's configuration, in the bytes of the header.
-    const ncfUInt8* configBegin = nullptr;
-    const ncfUInt8* configEnd = nullptr;
 
     // How samples lie whose table says that each has one byte.
     PacketLayout OldLayout() const { return {framesPerPacket, bytesPerPacket}; }
