@@ -81,6 +81,20 @@ TEST(QuickTimeWrapper, TakesTheEditorsRateForSoundAlone) {
     EXPECT_EQ(wrapper->GetMovieBox(&width, &height, nullptr, nullptr), NCF_E_NOTFOUND);
 }
 
+// The header's length is that of the longest track, which need not be the first.
+TEST(QuickTimeWrapper, CountsByTheFirstTrackOrByTheHeaderAsAsked) {
+    NEEDS_FFMPEG();
+    for (const char* first : {"testsrc2=s=64x48:r=25:d=1", "sine=d=1:r=48000"}) {
+        const MadeMovie movie(std::string("-f lavfi -i ") + first +
+                              " -f lavfi -i sine=d=2:r=48000 -map 0 -map 1 -c:v mpeg4 -c:a "
+                              "pcm_s16le");
+        const Wrapper wrapper = OpenWrapper(movie.Path());
+        ASSERT_TRUE(wrapper);
+        EXPECT_EQ(Ask(wrapper, 0.0, 25.0, 0, false).units, 25u) << first;
+        EXPECT_EQ(Ask(wrapper, 0.0, 25.0, 0, true).units, 50u) << first;
+    }
+}
+
 TEST(QuickTimeWrapper, NoticesTracksThatDisagreeWithTheLength) {
     NEEDS_FFMPEG();
     const MadeMovie movie(
