@@ -32,6 +32,7 @@ public:
     bool IsReordered() const { return isReordered_; }
     bool HasOneDuration() const { return hasOneDuration_; }
     ncfUInt64 TotalDuration() const { return total_; }
+    ncfUInt64 MeanDuration() const { return sampleCount_ == 0 ? 0 : total_ / sampleCount_; }
 
     // The sample on show at that time of the shifted display axis; false
     // behind the end.

@@ -213,17 +213,46 @@ Verdict ReadDescriptions(const Atom& stsd, const std::vector<bool>& references, 
                                           : Broken("stsd holds fewer entries than it claims");
 }
 
-// The media's own duration where it is known, else that of its samples; the
-// track's is that of its edits, its header, or its media.
+// Whether the track plays its media whole by what the headers of both say, to
+// the nearest unit of the media.
+bool PlaysAll(ncfUInt64 duration, ncfUInt64 mediaDuration, ncfUInt32 movieTimeScale,
+              ncfUInt32 mediaTimeScale) {
+    if (duration > kMax32 || mediaDuration > kMax32) {
+        return false;
+    }
+    const ncfUInt64 played = duration * mediaTimeScale;
+    const ncfUInt64 held = mediaDuration * movieTimeScale;
+    return (played > held ? played - held : held - played) <= movieTimeScale / 2;
+}
+
+// A medium lasts as long as its samples. Its header is believed where it says so
+// too, give or take a sample, and of plain sound where the track agrees with it:
+// hosts read that from the file, up to the end that both tell.
+ncfUInt64 DurationOfMedia(std::optional<ncfUInt64> header, bool isPlainSoundPlayedWhole,
+                          const SampleTimes& samples) {
+    const ncfUInt64 sum = samples.TotalDuration();
+    const ncfUInt64 told = header.value_or(sum);
+    if (sum == 0 || isPlainSoundPlayedWhole) {
+        return told;
+    }
+    return (told > sum ? told - sum : sum - told) > samples.MeanDuration() ? sum : told;
+}
+
+// The track's duration is that of its edits, its header, or its media.
 Verdict SetDurations(std::optional<ncfUInt64> header, std::optional<ncfUInt64> media,
                      ncfUInt32 movieTimeScale, Track& track) {
-    const ncfUInt64 mediaDuration = media.value_or(track.samples.Times().TotalDuration());
-    ncfUInt64 duration = track.edits.Duration();
-    if (duration == 0) {
-        duration =
-            header.value_or(MultiplyDivide(mediaDuration, movieTimeScale, track.mediaTimeScale));
+    std::optional<ncfUInt64> told = header;
+    if (track.edits.Duration() != 0) {
+        told = track.edits.Duration();
     }
-    if (mediaDuration > kMax32 || duration > kMax32) {
+    const bool isPlainSoundPlayedWhole =
+        !track.sound.empty() && track.sound.front().isLinear && told && media &&
+        PlaysAll(*told, *media, movieTimeScale, track.mediaTimeScale);
+    const ncfUInt64 mediaDuration =
+        DurationOfMedia(media, isPlainSoundPlayedWhole, track.samples.Times());
+    const ncfUInt64 duration =
+        told.value_or(MultiplyDivide(mediaDuration, movieTimeScale, track.mediaTimeScale));
+    if (media.value_or(0) > kMax32 || mediaDuration > kMax32 || duration > kMax32) {
         return NotSupported("a track's duration does not fit 32 bits");
     }
     track.mediaDuration = static_cast<ncfUInt32>(mediaDuration);

@@ -65,6 +65,15 @@ double SecondsOf(const std::vector<PacketEntry>& packets, const AVStream& stream
     return span > 0.0 ? span * av_q2d(stream.time_base) : 0.0;
 }
 
+// From the start of the first sample to that of the last.
+double SpanOfIndex(AVStream& stream) {
+    const int count = avformat_index_get_entries_count(&stream);
+    return count < 2
+               ? 0.0
+               : static_cast<double>(avformat_index_get_entry(&stream, count - 1)->timestamp) -
+                     static_cast<double>(avformat_index_get_entry(&stream, 0)->timestamp);
+}
+
 // 0 for none.
 ncfUInt32 Lowest(const std::vector<ncfUInt32>& tracks) {
     return tracks.empty() ? 0 : *std::min_element(tracks.begin(), tracks.end());
@@ -271,11 +280,16 @@ double MovieFile::MeanRateOfMedia(int stream) const {
     if (!whole || stream >= static_cast<int>(whole->nb_streams)) {
         return 0.0;
     }
-    const AVStream& of = *whole->streams[stream];
-    return of.nb_frames > 0 && IsKnownDuration(of.duration)
-               ? static_cast<double>(of.nb_frames) /
-                     (static_cast<double>(of.duration) * av_q2d(of.time_base))
-               : 0.0;
+    AVStream& of = *whole->streams[stream];
+    if (of.nb_frames <= 0 || !IsKnownDuration(of.duration)) {
+        return 0.0;
+    }
+    // A header that ends before the last sample begins is wrong.
+    const double span = SpanOfIndex(of);
+    const auto told = static_cast<double>(of.duration);
+    const auto samples = static_cast<double>(of.nb_frames);
+    const double rate = told < span ? (samples - 1) / span : samples / told;
+    return rate / av_q2d(of.time_base);
 }
 
 // Pictures by the time from the first to the end of the last. 0.0 for a track

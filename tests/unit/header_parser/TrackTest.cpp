@@ -64,6 +64,96 @@ TEST(Track, DerivesAnUnknownMediaDurationFromItsSamples) {
     }
 }
 
+// The thirty samples of a plain movie last a unit each.
+TEST(Track, LastsAsLongAsItsSamplesWhereItsHeaderIsMoreThanOneOff) {
+    const struct {
+        ncfUInt64 told;
+        ncfUInt32 expected;
+    } kHeaders[] = {{30, 30}, {31, 31}, {29, 29}, {32, 30}, {28, 30}, {1, 30}, {100, 30}};
+    for (const unsigned version : {0u, 1u}) {
+        for (const auto& header : kHeaders) {
+            Movie movie = PlainMovie();
+            movie.tracks[0].headerVersion = version;
+            movie.tracks[0].mediaDuration = header.told;
+            EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetMediaDuration),
+                      header.expected)
+                << header.told;
+        }
+    }
+}
+
+TEST(Track, MeasuresItsHeaderByTheMeanOfUnevenSamples) {
+    const struct {
+        ncfUInt64 told;
+        ncfUInt32 expected;
+    } kHeaders[] = {{640, 640}, {641, 600}, {560, 560}, {559, 600}};
+    for (const auto& header : kHeaders) {
+        Movie movie = PlainMovie();
+        movie.tracks[0].samples = {{10, 100, 20}, {4, 100, 50}, {1, 100, 200}};
+        movie.tracks[0].mediaDuration = header.told;
+        EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetMediaDuration), header.expected)
+            << header.told;
+    }
+}
+
+TEST(Track, BelievesItsHeaderWhereItsSamplesTakeNoTime) {
+    for (const std::uint64_t count : {0u, 5u}) {
+        Movie movie = PlainMovie();
+        movie.tracks[0].samples = {{count, 100, 0}};
+        movie.tracks[0].mediaDuration = 40;
+        EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetMediaDuration), 40u);
+    }
+}
+
+TEST(Track, OfPlainSoundIsAsLongAsItsHeadersAgree) {
+    const struct {
+        ncfUInt64 media;
+        ncfUInt64 track;  // a tenth of a second is 4800 units of the media
+        ncfUInt32 expected;
+    } kHeaders[] = {
+        {4800, 60, 4800}, {9600, 120, 9600}, {2400, 30, 2400}, {2401, 30, 4800},
+        {9600, 60, 4800}, {9600, 0, 4800},  // nothing but the media's header says so
+    };
+    for (const auto& header : kHeaders) {
+        Movie movie;
+        movie.tracks = {movies::SoundTrack(movies::SoundFormat(), 4800)};
+        movie.tracks[0].mediaDuration = header.media;
+        movie.tracks[0].trackDuration = header.track;
+        EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), header.expected)
+            << header.media << " in " << header.track;
+        movies::SoundFormat packed;
+        packed.codec = "mp4a";
+        movie.tracks[0].descriptions = {packed.ToBox()};
+        EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), 4800u)
+            << "compressed";
+    }
+}
+
+// An edit counts for more than the track's header.
+TEST(Track, OfPlainSoundAgreesWithItsEditsFirst) {
+    Movie movie;
+    movie.tracks = {movies::SoundTrack(movies::SoundFormat(), 4800)};
+    movie.tracks[0].mediaDuration = 9600;
+    movie.tracks[0].trackDuration = 120;
+    movie.tracks[0].edits = {{60, 0, 1.0}};
+    EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), 4800u);
+    movie.tracks[0].edits = {{120, 0, 1.0}};
+    EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), 9600u);
+}
+
+TEST(Track, WhoseSamplesLastLongerThan32BitsTellIsRefused) {
+    const auto parsed = [](std::uint32_t duration) {
+        Movie movie = PlainMovie();
+        movie.tracks[0].samples = {{2, 100, duration}};
+        movie.tracks[0].mediaDuration = 30;
+        return ParsedMovie(movie);
+    };
+    EXPECT_EQ(Ask(parsed(0x7FFFFFFF).Video(), &ITrackInfo::GetMediaDuration), 0xFFFFFFFEu);
+    EXPECT_EQ(parsed(0x80000000).Result(), NCF_E_NOTSUPPORTED);
+    EXPECT_NE(parsed(0x80000000).Reason().find("32 bits"), std::string::npos);
+    EXPECT_EQ(parsed(0xFFFFFFFF).Result(), NCF_E_NOTSUPPORTED);
+}
+
 TEST(Track, DerivesAnUnknownDurationFromItsMedia) {
     for (const ncfUInt64 unknown : {ncfUInt64{0}, ncfUInt64{0xFFFFFFFF}}) {
         Movie movie = PlainMovie();

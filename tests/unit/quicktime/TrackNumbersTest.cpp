@@ -211,6 +211,25 @@ TEST(FirstPictureTrack, IsThatOfTheLowestNumberWhereTheHeaderIsRefused) {
     EXPECT_EQ(count, 3u);
 }
 
+// As with a header that is read: what samples last counts, give or take one.
+TEST(TrackDescriptions, TellTheRateOfTheSamplesWhateverTheHeaderSays) {
+    for (const std::uint64_t told : {10u, 28u, 30u, 300u}) {
+        movies::Movie movie;
+        movie.tracks = {movies::VideoTrack(movies::VideoFormat(), 30, 30, 1, 100)};
+        movie.tracks[0].mediaDuration = told;
+        const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+        const Wrapper wrapper = OpenWrapper(file.Path());
+        ASSERT_TRUE(wrapper);
+        ncfSInt32 numerator = 0, denominator = 0;
+        ncfUInt64 length = 0, track = 0;
+        ASSERT_EQ(wrapper->DetermineMovieEditRateAndLength(0, 25, 60, &numerator, &denominator,
+                                                           &length, &track, 1, 0),
+                  NCF_OK);
+        EXPECT_EQ(numerator, 30) << told;
+        EXPECT_EQ(denominator, 1) << told;
+    }
+}
+
 TEST(TrackDescriptions, TellVendorsOfAnyBytes) {
     const auto vendorOf = [](const std::string& vendor) {
         movies::Movie movie;
