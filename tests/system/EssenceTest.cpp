@@ -200,6 +200,51 @@ TEST_F(EssenceMap, SaysThatTheSoundBehindASecondPictureCantBeDelivered) {
     EXPECT_FALSE(std::filesystem::exists(folder() / "a.wav"));
 }
 
+// Two picture tracks of other sizes and lengths, whose ids do not rise in file
+// order. Where the headers are read the first of the file counts, else that of
+// the lowest id; all that is said and delivered is of one track.
+TEST_F(EssenceMap, IsThatOfThePictureTrackThatIsDescribedAndDelivered) {
+    const struct {
+        const char* name;
+        const char* options;
+        std::uint64_t pictures;
+        int width;
+    } kMovies[] = {{"whole.mov", "", 10, 64},
+                   {"fragments.mp4", "-movflags frag_keyframe+empty_moov", 5, 32}};
+    for (const auto& each : kMovies) {
+        SCOPED_TRACE(each.name);
+        const auto movie = folder() / each.name;
+        ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=64x48:r=25:d=0.4 "
+                             "-f lavfi -i testsrc2=s=32x16:r=25:d=0.2 -map 0 -map 1 -c:v mpeg4 "
+                             "-streamid 0:5 -streamid 1:2 -use_stream_ids_as_track_ids 1 " +
+                             std::string(each.options) + " " + movie.string())
+                      .status,
+                  0);
+        Essence essence(session(), movie);
+        const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
+        EXPECT_EQ(track.length, each.pictures);
+        EXPECT_EQ(track.shape.numerator, each.width == 64 ? 4 : 2);
+        const auto packets = PacketsOf(movie, each.width == 64 ? "v:0" : "v:1");
+        const auto samples = Samples(essence, track.number);
+        ASSERT_EQ(samples.size(), each.pictures);
+        ASSERT_EQ(packets.size(), each.pictures);
+        for (std::size_t i = 0; i < samples.size(); ++i) {
+            EXPECT_EQ(samples[i].position, packets[i].position);
+            EXPECT_EQ(samples[i].size, packets[i].size);
+        }
+        FrameReader reader(essence, track, "2vuy");
+        EXPECT_EQ(reader.width(), each.width);
+        EXPECT_EQ(reader.Count(), each.pictures);
+        EXPECT_GT(SignalToNoise(
+                      OneFrame(reader, each.pictures - 1),
+                      Decoded(movie, std::string("-map ") + (each.width == 64 ? "0:v:0" : "0:v:1") +
+                                         " -vsync 0 -vf 'select=eq(n\\," +
+                                         std::to_string(each.pictures - 1) +
+                                         ")' -f rawvideo -pix_fmt uyvy422")),
+                  30.0);
+    }
+}
+
 TEST_F(EssenceMap, OfOneClipIsMadeTwiceAndEachServesItsOwnFormat) {
     const auto movie = MadeMovie("prores_with_pcm.mov");
     EssenceBytes wanted2vuy, wantedB64a;
