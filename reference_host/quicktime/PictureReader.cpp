@@ -68,10 +68,23 @@ PictureReader::PictureReader(std::filesystem::path path, InputOwner input, Codec
       cache_(kMostCachedBytes),
       packet_(av_packet_alloc()) {}
 
+void PictureReader::Release() {
+    codec_.reset();
+    cache_.Clear();
+    isRunning_ = false;
+    lastAsked_ = 0;
+}
+
 NCFRESULT PictureReader::Read(std::size_t picture, std::shared_ptr<const AVFrame>& frame) {
     frame = nullptr;
     if (picture >= order_.PictureCount()) {
         return NMA_E_NODATA;
+    }
+    if (!codec_) {
+        codec_ = OpenDecoder(*input_->streams[stream_]);
+    }
+    if (!codec_) {
+        return NCF_E_FAIL;
     }
     const bool goesBack = picture < lastAsked_;
     lastAsked_ = picture;

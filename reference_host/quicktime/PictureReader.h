@@ -29,6 +29,11 @@ public:
     // decode, after which all others still work.
     NCFRESULT Read(std::size_t picture, std::shared_ptr<const AVFrame>& frame);
 
+    // Gives the decoder and the pictures that were kept back; the next read makes
+    // a decoder anew. What is known of the stream's packets stays.
+    void Release();
+    bool HoldsDecoder() const { return codec_ != nullptr; }
+
     // How many packets were decoded so far.
     ncfUInt64 DecodedPackets() const { return decodedPackets_; }
 

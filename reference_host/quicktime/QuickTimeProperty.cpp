@@ -14,6 +14,7 @@
 namespace host {
 
 NCFRESULT QuickTimeProperty::CreateMovie(INCFString* path) {
+    const std::lock_guard<std::mutex> lock(mutex_);
     pixels_.reset();
     return Guarded([&] {
         std::filesystem::path file;
@@ -37,6 +38,7 @@ NCFRESULT QuickTimeProperty::CreateMovie(INCFString* path) {
 }
 
 NCFRESULT QuickTimeProperty::GetCodecPixelFormats(INCFBuffer** codes, ncfUInt32* count) {
+    const std::lock_guard<std::mutex> lock(mutex_);
     if (!codes || !count) {
         return NCF_E_POINTER;
     }
@@ -75,6 +77,7 @@ NCFRESULT QuickTimeProperty::GetCodecName(ncfUInt32 codecType, INCFString* name)
 }
 
 NCFRESULT QuickTimeProperty::GetCodecStorageType(ncfUInt32* type) {
+    const std::lock_guard<std::mutex> lock(mutex_);
     if (!type) {
         return NCF_E_POINTER;
     }
@@ -87,6 +90,7 @@ NCFRESULT QuickTimeProperty::GetCodecStorageType(ncfUInt32* type) {
 
 // 'BGRA' comes in full range always.
 NCFRESULT QuickTimeProperty::DoesCodecSupportRGB_CCIR(ncfUInt32* flag) {
+    const std::lock_guard<std::mutex> lock(mutex_);
     if (!flag) {
         return NCF_E_POINTER;
     }

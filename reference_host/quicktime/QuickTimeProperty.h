@@ -3,6 +3,7 @@
 #pragma once
 
 #include <memory>
+#include <mutex>
 
 #include "host_interfaces/quicktime/QuickTimeProperty.h"
 #include "reference_host/framework/Component.h"
@@ -11,7 +12,8 @@
 namespace host {
 
 // Answers about codecs. What a codec's pixels may be delivered as follows from
-// what its decoder gives.
+// what its decoder gives. The sample maps of a clip share one, so each operation
+// on the movie locks.
 class QuickTimeProperty final : public Component<QuickTime::IQuickTimeProperty> {
 public:
     NCFRESULT CreateMovie(INCFString* path) override;
@@ -21,6 +23,7 @@ public:
     NCFRESULT DoesCodecSupportRGB_CCIR(ncfUInt32* flag) override;
 
 private:
+    std::mutex mutex_;
     std::unique_ptr<CodecPixels> pixels_;  // null until a movie is open
 };
 

@@ -34,7 +34,13 @@ NCFRESULT VideoReader::InitQT(ncfUInt32 mode) {
 NCFRESULT VideoReader::ReleaseQT() {
     const std::lock_guard<std::mutex> lock(mutex_);
     isStarted_ = false;
-    return NCF_OK;
+    last_.reset();
+    return Guarded([&] {
+        if (pictures_) {
+            pictures_->Release();
+        }
+        return NCF_OK;
+    });
 }
 
 ncfUInt32 VideoReader::GetFrameBufferSize(ncfUInt32, ncfUInt64, ncfUInt32) {

@@ -13,8 +13,9 @@
 
 namespace host {
 
-// The wrapper's video reader. Two sample maps of one clip share it without a
-// lock of their own, so each operation locks.
+// The wrapper's video reader. Each operation locks, so that the reader stays
+// whole. A frame takes three of them, and nothing keeps who shares the reader
+// from setting another pixel format between.
 class VideoReader final : public Component<QTWrapper::IQTVideoReader> {
 public:
     // The first picture track, with the size in which pictures are delivered.
@@ -40,7 +41,7 @@ private:
     Source source_;
     ncfUInt32 layout_ = 0;  // 0: none was set
     bool isStarted_ = false;
-    std::unique_ptr<PictureReader> pictures_;  // opened with the first start, kept while released
+    std::unique_ptr<PictureReader> pictures_;  // opened with the first start
     std::shared_ptr<const AVFrame> last_;      // video and alpha ask for it in turn
     ncfUInt64 lastSample_ = 0;
 };

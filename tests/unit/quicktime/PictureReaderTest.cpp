@@ -78,4 +78,36 @@ TEST(PictureCache, KeepsThoseNearestWithinItsMemory) {
     EXPECT_EQ(cache.Bytes(), 0u);
 }
 
+TEST(PictureReader, GivesDecoderAndKeptPicturesBackAndMakesThemAnew) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie(
+        "-f lavfi -i testsrc2=s=96x64:r=25:d=1 -c:v libx264 -bf 2 -g 12 -pix_fmt yuv420p");
+    const auto reader = Open(movie);
+    std::shared_ptr<const AVFrame> frame;
+    std::vector<std::weak_ptr<const AVFrame>> kept;
+    for (const std::size_t picture : {3u, 4u, 5u}) {
+        ASSERT_EQ(reader->Read(picture, frame), NCF_OK);
+        kept.push_back(frame);
+    }
+    const Bytes before(frame->data[0], frame->data[0] + frame->linesize[0] * frame->height);
+    frame.reset();
+    EXPECT_FALSE(kept.back().expired());
+    EXPECT_TRUE(reader->HoldsDecoder());
+    reader->Release();
+    EXPECT_FALSE(reader->HoldsDecoder());
+    for (const auto& each : kept) {
+        EXPECT_TRUE(each.expired());
+    }
+    const auto decoded = reader->DecodedPackets();
+    ASSERT_EQ(reader->Read(5, frame), NCF_OK);
+    EXPECT_TRUE(reader->HoldsDecoder());
+    EXPECT_GT(reader->DecodedPackets(), decoded);
+    EXPECT_EQ(Bytes(frame->data[0], frame->data[0] + frame->linesize[0] * frame->height), before);
+    reader->Release();
+    reader->Release();
+    EXPECT_EQ(reader->Read(25, frame), NMA_E_NODATA);
+    EXPECT_FALSE(reader->HoldsDecoder()) << "nothing to decode";
+    EXPECT_EQ(reader->Read(24, frame), NCF_OK);
+}
+
 }  // namespace

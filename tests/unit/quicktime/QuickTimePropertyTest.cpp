@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
+#include <atomic>
+#include <thread>
 #include <vector>
 
 #include "reference_host/framework/HostPath.h"
@@ -57,6 +59,32 @@ TEST(QuickTimeProperty, NamesNoneForSoundAlone) {
     ncfUInt32 count = 7;
     EXPECT_EQ(property->GetCodecPixelFormats(buffer.Out(), &count), NCF_OK);
     EXPECT_EQ(count, 0u);
+}
+
+// Who asks while another opens the movie again waits for it.
+TEST(QuickTimeProperty, AnswersOnSeveralThreads) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=0.2 -c:v libx264 -pix_fmt yuv420p");
+    const auto property = host::MakeRef<host::QuickTimeProperty>();
+    const auto path = host::ModulePath(movie.Path());
+    ASSERT_EQ(property->CreateMovie(path.get()), NCF_OK);
+    std::atomic<bool> isOpening{true};
+    std::thread opening([&] {
+        for (int i = 0; i < 20; ++i) {
+            EXPECT_EQ(property->CreateMovie(path.get()), NCF_OK);
+        }
+        isOpening = false;
+    });
+    int wrong = 0;
+    while (isOpening) {
+        host::Ref<INCFBuffer> buffer;
+        ncfUInt32 count = 0, storage = 7, range = 7;
+        wrong += property->GetCodecPixelFormats(buffer.Out(), &count) != NCF_OK || count != 2;
+        wrong += property->GetCodecStorageType(&storage) != NCF_OK || storage != 0;
+        wrong += property->DoesCodecSupportRGB_CCIR(&range) != NCF_OK || range != 0;
+    }
+    opening.join();
+    EXPECT_EQ(wrong, 0);
 }
 
 }  // namespace

@@ -4,8 +4,11 @@
 
 #include <algorithm>
 #include <cstring>
+#include <filesystem>
+#include <iterator>
 #include <numeric>
 #include <random>
+#include <thread>
 
 #include "tests/unit/quicktime/MadeMovie.h"
 
@@ -269,6 +272,29 @@ TEST(VideoReader, StartsAndStopsAgain) {
     EXPECT_EQ(result, NMA_E_NODATA);
     Picture(*reader, ~ncfUInt64{0}, &result);
     EXPECT_EQ(result, NMA_E_NODATA);
+}
+
+std::ptrdiff_t ThreadsRunning() {
+    return std::distance(std::filesystem::directory_iterator("/proc/self/task"), {});
+}
+
+// A decoder has threads of its own where there are several processors.
+TEST(VideoReader, HoldsNoDecoderWhileReleased) {
+    NEEDS_FFMPEG();
+    if (std::thread::hardware_concurrency() < 2) {
+        GTEST_SKIP() << "one processor, no threads to count";
+    }
+    const MadeMovie movie(std::string(kFilm) + "-c:v libx264 -pix_fmt yuv420p");
+    const auto before = ThreadsRunning();
+    const auto reader = OpenVideo(movie.Path(), Code("2vuy"));
+    ASSERT_TRUE(reader);
+    const Bytes first = Picture(*reader, 3);
+    EXPECT_GT(ThreadsRunning(), before);
+    EXPECT_EQ(reader->ReleaseQT(), NCF_OK);
+    EXPECT_EQ(ThreadsRunning(), before);
+    EXPECT_EQ(reader->InitQT(0), NCF_OK);
+    EXPECT_EQ(Picture(*reader, 3), first);
+    EXPECT_GT(ThreadsRunning(), before);
 }
 
 struct Made {
