@@ -16,6 +16,7 @@
 #include "reference_host/cliphost/PngFile.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/TurnOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -30,16 +31,19 @@ struct ContactOptions {
     int frames = 12;
     int columns = 4;
     int width = 320;
+    TurnOption turn;
     ParameterOptions parameters;
 };
 
 // Cells have the shape in which the clip is shown, whatever its pixels are.
-int CellHeight(const ContactOptions& options, const ClipTrack& track, const FrameReader& reader) {
+int CellHeight(const ContactOptions& options, const ClipTrack& track, const FrameReader& reader,
+               const PictureTurn& turn) {
     const aafRational_t& shape = track.shape;
-    const double told = shape.denominator > 0 && shape.numerator > 0
-                            ? static_cast<double>(shape.denominator) / shape.numerator
-                            : static_cast<double>(reader.height()) / reader.width();
-    const double height = options.width * std::clamp(told, 0.05, 20.0);
+    const double stored = shape.denominator > 0 && shape.numerator > 0
+                              ? static_cast<double>(shape.denominator) / shape.numerator
+                              : static_cast<double>(reader.height()) / reader.width();
+    const double shown = turn.swapsSides ? 1.0 / stored : stored;
+    const double height = options.width * std::clamp(shown, 0.05, 20.0);
     return std::max(1, static_cast<int>(std::lround(height)));
 }
 
@@ -61,8 +65,9 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     if (frames.empty() || reader.width() == 0) {
         throw Failure(kExitFile, options.movie, "it has no frames");
     }
+    const PictureTurn turn = options.turn.TurnFor(options.movie);
     ContactSheet sheet(static_cast<int>(frames.size()), options.columns, options.width,
-                       CellHeight(options, track, reader));
+                       CellHeight(options, track, reader, turn));
     Progress progress("frames", frames.size());
     std::size_t failed = 0;
     for (const std::uint64_t frame : frames) {
@@ -79,7 +84,7 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
             Notice("cliphost: {}: frame {} could not be read: {}\n", DisplayPath(options.movie),
                    frame, ResultText(result));
         }
-        sheet.Add(picture);
+        sheet.Add(Turned(std::move(picture), turn));
     }
     if (failed == frames.size()) {
         throw Failure(kExitFile, options.movie, "no frame could be read, so there is no sheet");
@@ -117,6 +122,7 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_option("--width", options->width, "Of a picture, in pixels")
         ->check(CLI::Range(16, 2048))
         ->capture_default_str();
+    options->turn.AddTo(*verb);
     options->parameters.AddTo(*verb);
     verb->callback([&session, &status, options] {
         Session running(session);

@@ -15,12 +15,14 @@ namespace {
 
 using host::DisplayPath;
 
-void WritePng(const std::filesystem::path& file, const FrameReader& reader,
-              const FrameReader* alpha) {
+// Gives the picture that was written.
+Picture WritePng(const std::filesystem::path& file, const FrameReader& reader,
+                 const FrameReader* alpha, const PictureTurn& turn) {
     Picture picture = reader.ToPicture();
     if (alpha) {
         picture = WithAlpha(picture, alpha->ToPicture());
     }
+    picture = Turned(std::move(picture), turn);
     const std::vector<unsigned char> png = ToPng(picture);
     if (png.empty()) {
         throw Failure(kExitFile, file,
@@ -31,6 +33,7 @@ void WritePng(const std::filesystem::path& file, const FrameReader& reader,
     OutputFile output(file);
     output.Write(png.data(), png.size());
     output.Finish();
+    return picture;
 }
 
 class RawSink final : public FrameSink {
@@ -57,12 +60,13 @@ private:
 
 class PngSink final : public FrameSink {
 public:
-    explicit PngSink(std::filesystem::path file) : file_(std::move(file)) {}
+    PngSink(std::filesystem::path file, const PictureTurn& turn)
+        : file_(std::move(file)), turn_(turn) {}
 
     void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {
-        WritePng(file_, reader, alpha);
-        words_ = fmt::format("{}: frame {}, {} x {}", DisplayPath(file_), frame, reader.width(),
-                             reader.height());
+        const Picture picture = WritePng(file_, reader, alpha, turn_);
+        words_ = fmt::format("{}: frame {}, {} x {}", DisplayPath(file_), frame, picture.width,
+                             picture.height);
     }
     void Finish() override {}
     std::string Summary() const override { return words_; }
@@ -70,13 +74,14 @@ public:
 
 private:
     std::filesystem::path file_;
+    PictureTurn turn_;
     std::string words_;
 };
 
 class FolderSink final : public FrameSink {
 public:
-    FolderSink(std::filesystem::path folder, std::filesystem::path stem)
-        : folder_(std::move(folder)), stem_(std::move(stem)) {
+    FolderSink(std::filesystem::path folder, std::filesystem::path stem, const PictureTurn& turn)
+        : folder_(std::move(folder)), stem_(std::move(stem)), turn_(turn) {
         std::error_code error;
         std::filesystem::create_directories(folder_, error);
         if (error) {
@@ -87,7 +92,7 @@ public:
     void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {
         std::filesystem::path name = stem_;
         name += fmt::format("_{:06}.png", frame);
-        WritePng(folder_ / name, reader, alpha);
+        WritePng(folder_ / name, reader, alpha, turn_);
         ++frames_;
     }
     void Finish() override {}
@@ -99,25 +104,27 @@ public:
 private:
     std::filesystem::path folder_;
     std::filesystem::path stem_;
+    PictureTurn turn_;
     std::uint64_t frames_ = 0;
 };
 
 }  // namespace
 
 std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
-                                         const std::filesystem::path& movie, bool isOneFrame) {
+                                         const std::filesystem::path& movie, bool isOneFrame,
+                                         const PictureTurn& turn) {
     const std::string ending = output.extension().string();
     std::error_code ignored;
     RefuseOutputOntoMovie(output, movie);
     if (std::filesystem::is_directory(output, ignored)) {
-        return std::make_unique<FolderSink>(output, movie.stem());
+        return std::make_unique<FolderSink>(output, movie.stem(), turn);
     }
     if (OutputFile::IsStandardOutput(output) || ending == ".raw") {
         return std::make_unique<RawSink>(output);
     }
     if (ending == ".png") {
         if (isOneFrame) {
-            return std::make_unique<PngSink>(output);
+            return std::make_unique<PngSink>(output, turn);
         }
         throw Failure(kExitCaller, output, "a PNG file holds one frame",
                       "give a folder or a .raw file for a range");
@@ -126,7 +133,7 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
         throw Failure(kExitCaller, output, fmt::format("'{}' is no ending that is written", ending),
                       "give FILE.png, FILE.raw, a folder, or - for standard output");
     }
-    return std::make_unique<FolderSink>(output, movie.stem());
+    return std::make_unique<FolderSink>(output, movie.stem(), turn);
 }
 
 std::string RawWords(const FrameReader& reader, const ClipTrack& track) {

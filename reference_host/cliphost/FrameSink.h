@@ -8,6 +8,7 @@
 
 #include "reference_host/cliphost/FrameReader.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/PictureTurn.h"
 
 namespace cliphost {
 
@@ -26,9 +27,10 @@ public:
 // The sink that a path asks for: "-" and FILE.raw take the bytes as they are
 // delivered, one frame behind the other; FILE.png takes one frame; a folder
 // takes a PNG for each, named after the movie and the frame, and is made when
-// it is not there. Throws a Failure for the caller.
+// it is not there. PNG pictures are turned. Throws a Failure for the caller.
 std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
-                                         const std::filesystem::path& movie, bool isOneFrame);
+                                         const std::filesystem::path& movie, bool isOneFrame,
+                                         const PictureTurn& turn);
 
 // What a program that reads raw frames has to be told: size, layout, rate.
 std::string RawWords(const FrameReader& reader, const ClipTrack& track);

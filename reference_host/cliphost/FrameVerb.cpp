@@ -10,6 +10,7 @@
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/TurnOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -26,6 +27,7 @@ struct FrameOptions {
     std::string format;
     std::filesystem::path output;
     bool withAlpha = false;
+    TurnOption turn;
     ParameterOptions parameters;
 };
 
@@ -76,7 +78,8 @@ int FrameRun::Run() {
     }
     const FrameRange range = WantedFrames();
     const std::uint64_t count = range.CountIn(*range.end);
-    const auto sink = MakeFrameSink(options_.output, options_.movie, count == 1);
+    const auto sink = MakeFrameSink(options_.output, options_.movie, count == 1,
+                                    options_.turn.TurnFor(options_.movie));
     if (sink->IsRaw() && options_.withAlpha) {
         throw Failure(kExitCaller, options_.output, "--with-alpha is for PNG files",
                       "raw frames of the alpha are those of its own track, see `cliphost formats "
@@ -146,6 +149,7 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
                      "a picture can be made of when not given");
     verb->add_flag("--with-alpha", options->withAlpha,
                    "Give the PNG pictures the alpha of the clip");
+    options->turn.AddTo(*verb);
     verb->add_option("-o,--output", options->output,
                      "FILE.png, FILE.raw, a folder for a PNG each, or - for raw frames on standard "
                      "output")
