@@ -259,6 +259,11 @@ TEST(SoundTrack, IsConstantWhenAllSamplesHaveOneSizeAndDuration) {
     EXPECT_EQ(answer, 1u);
     movie.tracks[0].samples = {{999, 4, 1}, {1, 4, 2}};
     EXPECT_EQ(ParsedMovie(movie).Sound()->HasConstantSampleRate(&answer), 1);
+    // A table that tells the same size for each one.
+    movie.tracks[0].samples = {{1000, 4, 1}};
+    movie.tracks[0].compactSizeBits = 8;
+    EXPECT_EQ(ParsedMovie(movie).Sound()->HasConstantSampleRate(&answer), 0);
+    EXPECT_EQ(answer, 0u);
 }
 
 }  // namespace

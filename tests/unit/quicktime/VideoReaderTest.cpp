@@ -181,6 +181,26 @@ TEST(VideoReader, TurnsYuvIntoRgbByTheStreamsMatrix) {
     }
 }
 
+// Rec. 601 for pictures of this size.
+TEST(VideoReader, TurnsRgbIntoYuv) {
+    NEEDS_FFMPEG();
+    struct Row {
+        const char* color;
+        int y, cb, cr;
+    };
+    for (const Row& row : {Row{"0xFF0000", 81, 90, 240}, Row{"0x00FF00", 145, 54, 34},
+                           Row{"0x0000FF", 41, 240, 110}, Row{"0xFFFFFF", 235, 128, 128}}) {
+        SCOPED_TRACE(row.color);
+        const MadeMovie movie(std::string("-f lavfi -i color=") + row.color +
+                              ":s=64x48:r=25:d=0.08,format=rgb24 -c:v qtrle");
+        const Bytes got = AllOf(movie, "2vuy");
+        ASSERT_FALSE(got.empty());
+        EXPECT_NEAR(got[0], row.cb, 1);
+        EXPECT_NEAR(got[1], row.y, 1);
+        EXPECT_NEAR(got[2], row.cr, 1);
+    }
+}
+
 TEST(VideoReader, BringsFullRangeToVideoRange) {
     NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i color=white:s=64x64:r=25:d=0.08,format=yuvj422p -c:v mjpeg");
