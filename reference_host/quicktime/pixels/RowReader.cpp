@@ -62,7 +62,7 @@ void RowReader::Read(int component, int line, float* to) const {
             std::memcpy(&value, row + static_cast<std::ptrdiff_t>(x) * part.step, sizeof value);
             to[x] = std::min(std::max(value, 0.0f), 1.0f) * 65535.0f;
         }
-    } else if (part.depth <= 8 && part.shift == 0 && part.depth == 8) {
+    } else if (part.depth == 8 && part.shift == 0) {
         part.step == 1 ? WidenBytes(row, width, to) : WidenStridedBytes(row, part.step, width, to);
     } else if (part.step == 2 && !isBigEndian && part.offset % 2 == 0) {
         WidenWords(row, part.shift, part.depth, width, to);

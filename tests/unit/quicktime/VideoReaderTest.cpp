@@ -9,6 +9,7 @@
 #include <numeric>
 #include <random>
 #include <thread>
+#include <tuple>
 
 #include "tests/unit/quicktime/MadeMovie.h"
 
@@ -198,6 +199,23 @@ TEST(VideoReader, TurnsRgbIntoYuv) {
         EXPECT_NEAR(got[0], row.cb, 1);
         EXPECT_NEAR(got[1], row.y, 1);
         EXPECT_NEAR(got[2], row.cr, 1);
+    }
+}
+
+// Five bits a component, packed into words.
+TEST(VideoReader, BringsFewBitsToWholeBytes) {
+    NEEDS_FFMPEG();
+    for (const auto& [color, blue, green, red] :
+         {std::tuple("0xFF0000", 0, 0, 255), std::tuple("0x00FF00", 0, 255, 0),
+          std::tuple("0x0000FF", 255, 0, 0), std::tuple("0xFFFFFF", 255, 255, 255)}) {
+        SCOPED_TRACE(color);
+        const MadeMovie movie(std::string("-f lavfi -i color=") + color +
+                              ":s=64x48:r=25:d=0.08,format=rgb24 -c:v qtrle -pix_fmt rgb555be");
+        const Bytes got = AllOf(movie, "BGRA");
+        ASSERT_FALSE(got.empty());
+        EXPECT_EQ(Bytes(got.begin(), got.begin() + 4),
+                  (Bytes{static_cast<std::uint8_t>(blue), static_cast<std::uint8_t>(green),
+                         static_cast<std::uint8_t>(red), 255}));
     }
 }
 
