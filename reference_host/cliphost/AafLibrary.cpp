@@ -103,7 +103,7 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     std::error_code error;
     std::filesystem::remove(fresh.path(), error);
     AafRef<IAAFFile> copy;
-    check(openNew(Wide(DisplayPath(fresh.path())).c_str(), &kAAFFileKind_Aaf512Binary, 0,
+    check(openNew(Wide(fresh.path().native()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
                   &identification, copy.Out()),
           "opening a new file");
     check(file->SaveCopyAs(copy.get()), "copying the description");
@@ -118,7 +118,7 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
 AafRef<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
     const auto openRead = find<AAFFileOpenExistingReadFunction>("AAFFileOpenExistingRead");
     AafRef<IAAFFile> file;
-    const HRESULT result = openRead(Wide(DisplayPath(path)).c_str(), 0, file.Out());
+    const HRESULT result = openRead(Wide(path.native()).c_str(), 0, file.Out());
     if (result < 0) {
         throw Failure(kExitFile, path, "can't be read as AAF: " + TextOfResult(result));
     }

@@ -9,6 +9,7 @@
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Progress.h"
@@ -91,7 +92,7 @@ void DescribeRun::GoOnAfterFailure(const std::filesystem::path& path, const Step
 void DescribeRun::Refuse(const std::filesystem::path& path, const Problem& problem) {
     ++failed_;
     TellProblem(problem, session_.verbosity());
-    nlohmann::ordered_json entry = {{"movie", DisplayPath(path)}};
+    nlohmann::ordered_json entry = {{"movie", MachinePath(path)}};
     AddProblem(problem, entry);
     json_.push_back(std::move(entry));
 }
@@ -131,9 +132,9 @@ void DescribeRun::Take(const Description& description) {
     ++described_;
     const TreeNode tree = ReadTree(shown.get());
     if (options_.json) {
-        nlohmann::ordered_json entry = {{"movie", DisplayPath(description.movie)}};
+        nlohmann::ordered_json entry = {{"movie", MachinePath(description.movie)}};
         if (!saved.empty()) {
-            entry["aaf"] = DisplayPath(saved);
+            entry["aaf"] = MachinePath(saved);
         }
         entry["description"] = nlohmann::ordered_json::parse(ToJson(tree));
         json_.push_back(std::move(entry));
@@ -173,7 +174,7 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const aaf = verb->add_option("--aaf", options->aafFile, "Save the one movie's file here");
     verb->add_option("--out-dir", options->outFolder, "Save every movie's file in this folder")
         ->excludes(aaf);
-    verb->add_flag("--json", options->json, "As JSON");
+    verb->add_flag("--json", options->json, kJsonHelp);
     verb->add_flag("-q,--quiet", options->quiet, "Only a line for each movie");
     verb->add_option("--pin-time", *pinned,
                      "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "

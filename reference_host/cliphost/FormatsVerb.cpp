@@ -5,6 +5,7 @@
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
@@ -138,7 +139,7 @@ void PrintTrack(const Json& track) {
 void Show(Essence& essence, bool json) {
     const Json list = FormatsOf(essence);
     if (json) {
-        PrintJson({{"movie", host::DisplayPath(essence.movie())}, {"tracks", list}});
+        PrintJson({{"movie", MachinePath(essence.movie())}, {"tracks", list}});
         return;
     }
     fmt::print("{}\n", host::DisplayPath(essence.movie()));
@@ -157,10 +158,10 @@ void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
     auto json = std::make_shared<bool>(false);
     auto parameters = std::make_shared<ParameterOptions>();
     verb->add_option("movie", *movie, "The movie")->required();
-    verb->add_flag("--json", *json, "As JSON");
+    verb->add_flag("--json", *json, kJsonHelp);
     parameters->AddTo(*verb);
     verb->callback([&session, movie, json, parameters] {
-        AnswerFailureToo(*json, {{"movie", host::DisplayPath(*movie)}}, [&] {
+        AnswerFailureToo(*json, {{"movie", MachinePath(*movie)}}, [&] {
             Session running(session);
             Essence essence = OpenEssence(running, *movie, *parameters);
             Show(essence, *json);

@@ -8,13 +8,17 @@
 #include <string>
 #include <utility>
 
+#include "reference_host/util/text/Printable.h"
+
 namespace cliphost {
 
-// Prints on standard error. One that takes nothing, on a full disk, must not end
-// what is being done: there is nobody left to tell.
+// Prints lines on standard error; what a movie's texts may hold of controls is
+// shown escaped. An output that takes nothing, on a full disk, must not end what
+// is being done: there is nobody left to tell.
 template <class... Arguments>
 void Notice(fmt::format_string<Arguments...> form, Arguments&&... arguments) {
-    const std::string text = fmt::format(form, std::forward<Arguments>(arguments)...);
+    const std::string text =
+        host::text::PrintableLines(fmt::format(form, std::forward<Arguments>(arguments)...));
     std::fwrite(text.data(), 1, text.size(), stderr);
 }
 

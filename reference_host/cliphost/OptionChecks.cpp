@@ -9,6 +9,7 @@
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
 namespace {
@@ -22,6 +23,20 @@ bool ReadWhole(const std::string& text, Number& number) {
     const char* const end = text.data() + text.size();
     const auto read = std::from_chars(text.data(), end, number);
     return read.ec == std::errc() && read.ptr == end;
+}
+
+// Each option of the program and of its verbs that takes a value.
+template <class Action>
+void ForEachValueOption(CLI::App& app, const Action& action) {
+    std::vector<CLI::App*> apps = app.get_subcommands([](CLI::App*) { return true; });
+    apps.push_back(&app);
+    for (CLI::App* const one : apps) {
+        for (CLI::Option* const option : one->get_options()) {
+            if (option->get_items_expected_max() > 0) {
+                action(*option);
+            }
+        }
+    }
 }
 
 }  // namespace
@@ -62,15 +77,21 @@ void RefuseEmptyTexts(CLI::App& app) {
             return text.empty() ? std::string("an empty text is no value") : std::string();
         },
         "", "NotEmpty");
-    std::vector<CLI::App*> apps = app.get_subcommands([](CLI::App*) { return true; });
-    apps.push_back(&app);
-    for (CLI::App* const one : apps) {
-        for (CLI::Option* const option : one->get_options()) {
-            if (option->get_items_expected_max() > 0) {
-                option->check(isThere);
-            }
-        }
-    }
+    ForEachValueOption(app, [&](CLI::Option& option) { option.check(isThere); });
+}
+
+void TakeFileUrls(CLI::App& app) {
+    const CLI::Validator toPath(
+        [](std::string& text) {
+            return !host::text::IsFileUrl(text) || host::text::PathOfFileUrl(text, text)
+                       ? std::string()
+                       : fmt::format(
+                             "'{}' names no file of this machine; write file:///FOLDER/FILE "
+                             "with %XX for special characters",
+                             text);
+        },
+        "", "FileUrl");
+    ForEachValueOption(app, [&](CLI::Option& option) { option.transform(toPath); });
 }
 
 void RefuseOutputOntoMovie(const std::filesystem::path& output,

@@ -20,6 +20,9 @@ CLI::Validator FrameRate();
 // variable of a script that was never set.
 void RefuseEmptyTexts(CLI::App& app);
 
+// Every option that takes a text takes a file URL as the path that it names.
+void TakeFileUrls(CLI::App& app);
+
 // Refuses an output that would be written over the movie that it is made from.
 // Throws a Failure.
 void RefuseOutputOntoMovie(const std::filesystem::path& output, const std::filesystem::path& movie);

@@ -7,6 +7,7 @@
 
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
@@ -90,7 +91,7 @@ void Print(ClipParameters& parameters, const ParamsOptions& options) {
         }
         return;
     }
-    nlohmann::ordered_json json = {{"movie", DisplayPath(options.movie)},
+    nlohmann::ordered_json json = {{"movie", MachinePath(options.movie)},
                                    {"set", set},
                                    {"parameters", nlohmann::ordered_json::array()}};
     for (const ClipParameter& parameter : list) {
@@ -111,9 +112,9 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
     auto* const xml = verb->add_option("--xml", options->xml,
                                        "Print a document: values, description or defaults");
     xml->check(CLI::IsMember(kXml));
-    verb->add_flag("--json", options->json, "As JSON")->excludes(xml);
+    verb->add_flag("--json", options->json, kJsonHelp)->excludes(xml);
     verb->callback([&session, options] {
-        AnswerFailureToo(options->json, {{"movie", DisplayPath(options->movie)}}, [&] {
+        AnswerFailureToo(options->json, {{"movie", MachinePath(options->movie)}}, [&] {
             Session running(session);
             host::Ref<NMA::IMediaContainer3> container;
             const NCFRESULT opened = OpenContainer(running, options->movie, container);

@@ -5,6 +5,7 @@
 
 #include "reference_host/cliphost/AafValue.h"
 #include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -42,7 +43,7 @@ nlohmann::ordered_json ToJson(const Session& session) {
         {"name", plugin.name},
         {"version", fmt::format("{}.{}", plugin.major, plugin.minor)},
         {"vendor", plugin.vendor},
-        {"file", host::DisplayPath(module.file())},
+        {"file", MachinePath(module.file())},
         {"id", ToText(plugin.id)},
         {"secondId", ToText(plugin.secondId)},
         {"componentCount", plugin.componentCount},
@@ -64,7 +65,7 @@ void AddPlugin(CLI::App& app, const SessionOptions& options, int&) {
     auto* const verb = app.add_subcommand("plugin", "Show what the module registered");
     verb->footer("Example: cliphost plugin --json");
     auto json = std::make_shared<bool>(false);
-    verb->add_flag("--json", *json, "As JSON");
+    verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, json] {
         const Session session(options);
         if (*json) {

@@ -8,12 +8,15 @@
 
 #include <cstdio>
 
-#include "reference_host/cliphost/Notice.h"
-
 namespace cliphost {
 namespace {
 
 constexpr std::size_t kWidth = 24;
+
+void Show(const std::string& text) {
+    std::fwrite(text.data(), 1, text.size(), stderr);
+    std::fflush(stderr);
+}
 
 }  // namespace
 
@@ -22,7 +25,7 @@ Progress::Progress(std::string what, std::size_t count)
 
 Progress::~Progress() {
     if (shown_) {
-        Notice("\r\033[K");
+        Show("\r\033[K");
     }
 }
 
@@ -32,9 +35,8 @@ void Progress::Step(const std::string& name) {
     }
     const std::size_t filled = kWidth * done_ / count_;
     ++done_;
-    Notice("\r\033[K{} [{}{}] {}/{} {}", what_, std::string(filled, '#'),
-           std::string(kWidth - filled, '.'), done_, count_, name);
-    std::fflush(stderr);
+    Show(fmt::format("\r\033[K{} [{}{}] {}/{} {}", what_, std::string(filled, '#'),
+                     std::string(kWidth - filled, '.'), done_, count_, name));
 }
 
 }  // namespace cliphost

@@ -4,6 +4,7 @@
 
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/SampleMap.h"
@@ -166,7 +167,7 @@ int SamplesRun::Run() {
                       fmt::format("it has {}", essence_.tracks().size()));
     }
     if (options_.json) {
-        PrintJson({{"movie", host::DisplayPath(options_.movie)},
+        PrintJson({{"movie", MachinePath(options_.movie)},
                    {"fileBytes", fileSize_},
                    {"tracks", tracks_}});
     }
@@ -187,9 +188,9 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_option("movie", options->movie, "The movie")->required();
     verb->add_option("--track", options->track, "Only this one")->check(SmallWholeNumber());
     verb->add_flag("--every", options->every, "Each sample of sound too, not its runs");
-    verb->add_flag("--json", options->json, "As JSON");
+    verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {
-        AnswerFailureToo(options->json, {{"movie", host::DisplayPath(options->movie)}}, [&] {
+        AnswerFailureToo(options->json, {{"movie", MachinePath(options->movie)}}, [&] {
             Session running(session);
             Essence essence = OpenEssence(running, options->movie);
             status = SamplesRun(essence, *options).Run();

@@ -9,6 +9,7 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/HostText.h"
@@ -29,7 +30,7 @@ struct FolderFacts {
     bool claimed = false;
     std::string name;
     ncfUInt32 newest = 0;
-    std::vector<std::string> movies;
+    std::vector<std::filesystem::path> movies;
 };
 
 FolderFacts Scan(Session& session, const std::filesystem::path& folder) {
@@ -46,9 +47,20 @@ FolderFacts Scan(Session& session, const std::filesystem::path& folder) {
     info->GetModificationDate(&facts.newest);
     const FolderClips clips(session, path.get());
     for (const FolderClip& clip : clips.clips()) {
-        facts.movies.push_back(host::DisplayPath(clip.path));
+        facts.movies.push_back(clip.path);
     }
     return facts;
+}
+
+nlohmann::ordered_json ToJson(const FolderFacts& facts) {
+    nlohmann::ordered_json movies = nlohmann::ordered_json::array();
+    for (const std::filesystem::path& movie : facts.movies) {
+        movies.push_back(MachinePath(movie));
+    }
+    return {{"claimed", facts.claimed},
+            {"name", facts.name},
+            {"newest", facts.newest},
+            {"movies", std::move(movies)}};
 }
 
 }  // namespace
@@ -60,7 +72,7 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
     auto folder = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);
     verb->add_option("folder", *folder, "The folder")->required();
-    verb->add_flag("--json", *json, "As JSON");
+    verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, &status, folder, json] {
         if (!std::filesystem::is_directory(*folder)) {
             throw Failure(kExitCaller, *folder, "is no folder",
@@ -70,10 +82,7 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
         const FolderFacts facts = Scan(session, *folder);
         status = facts.claimed ? kExitFine : kExitFile;
         if (*json) {
-            PrintJson({{"claimed", facts.claimed},
-                       {"name", facts.name},
-                       {"newest", facts.newest},
-                       {"movies", facts.movies}});
+            PrintJson(ToJson(facts));
             return;
         }
         if (!facts.claimed) {
@@ -82,8 +91,8 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
             return;
         }
         fmt::print("claimed: {}, newest movie of {}\n", facts.name, DateText(facts.newest));
-        for (const std::string& movie : facts.movies) {
-            fmt::print("  {}\n", movie);
+        for (const std::filesystem::path& movie : facts.movies) {
+            fmt::print("  {}\n", host::DisplayPath(movie));
         }
         fmt::print("{} movies\n", facts.movies.size());
     });

@@ -14,6 +14,7 @@
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/util/text/Printable.h"
 
 namespace {
 
@@ -65,7 +66,8 @@ std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
     if (app->get_subcommands().empty() && !rest.empty()) {
         text = fmt::format("'{}' is no verb and no option", rest.front());
     }
-    return fmt::format("cliphost: {}\nRun with --help for more information.\n", text);
+    return fmt::format("cliphost: {}\nRun with --help for more information.\n",
+                       host::text::PrintableLines(text));
 }
 
 int Run(int argc, char** argv) {
@@ -132,6 +134,7 @@ int Run(int argc, char** argv) {
     AddPlugin(app, session, status);
 
     RefuseEmptyTexts(app);
+    TakeFileUrls(app);
     app.failure_message(CommandLineProblem);
 
     try {

@@ -6,6 +6,7 @@
 #include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/util/text/Paths.h"
+#include "reference_host/util/text/Printable.h"
 
 namespace host {
 
@@ -24,7 +25,7 @@ Ref<String> ModulePath(const std::filesystem::path& path) {
 }
 
 std::string DisplayPath(const std::filesystem::path& path) {
-    return text::ToUtf8Lossy(text::FromSystemPath(path));
+    return text::Printable(text::ToUtf8Lossy(text::FromSystemPath(path)));
 }
 
 }  // namespace host

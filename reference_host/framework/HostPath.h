@@ -21,7 +21,8 @@ NCFRESULT PathFrom(INCFString* text, std::filesystem::path& out);
 // such form: see text::HoldsBackslash.
 Ref<String> ModulePath(const std::filesystem::path& path);
 
-// The path as UTF-8 for messages; undecodable bytes pass through.
+// The path for people, on one line: controls and bytes that are no UTF-8 are
+// escaped.
 std::string DisplayPath(const std::filesystem::path& path);
 
 }  // namespace host

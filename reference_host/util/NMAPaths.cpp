@@ -7,6 +7,7 @@
 #include "reference_host/util/Factory.h"
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/text/Encodings.h"
+#include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/util/text/Paths.h"
 
@@ -30,25 +31,6 @@ NCFRESULT GiveOut(const std::u32string& value, INCFString** out) {
     }
     *out = made;
     return NCF_OK;
-}
-
-bool IsUnreserved(unsigned char byte) {
-    return (byte >= 'A' && byte <= 'Z') || (byte >= 'a' && byte <= 'z') ||
-           (byte >= '0' && byte <= '9') || byte == '-' || byte == '.' || byte == '_' || byte == '~';
-}
-
-std::u32string Escaped(const std::string& bytes) {
-    static constexpr char32_t kDigits[] = U"0123456789ABCDEF";
-    std::u32string out;
-    for (const char byte : bytes) {
-        const auto value = static_cast<unsigned char>(byte);
-        if (IsUnreserved(value) || byte == '/') {
-            out.push_back(value);
-        } else {
-            out += {U'%', kDigits[value >> 4], kDigits[value & 15]};
-        }
-    }
-    return out;
 }
 
 bool StartsWithDrive(const std::u32string& path) {
@@ -96,7 +78,7 @@ NCFRESULT UrlOf(std::u32string path, std::u32string& url) {
     if (!text::ToUtf8(path, bytes)) {
         return NCF_E_FAIL;
     }
-    url += Escaped(bytes);
+    url += text::FromUtf8(text::PercentEncoded(bytes));
     return NCF_OK;
 }
 

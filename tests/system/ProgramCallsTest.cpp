@@ -206,6 +206,67 @@ TEST_F(ProgramCalls, GiveValidJsonForNamesThatAreNoUtf8) {
     }
 }
 
+// What --json says of a movie, given back as it stands, is that movie.
+TEST_F(ProgramCalls, TakeThePathsBackThatTheyGiveInJson) {
+    for (const char* const name : {"caf\xE9 \xFF.mov", "new\nline\x1B[2J.mov", "caf\xC3\xA9.mov"}) {
+        SCOPED_TRACE(name);
+        std::filesystem::create_directory(folder() / "in");
+        const auto movie = Quoted(Copy("png.mov", std::string("in/") + name));
+        const auto takesBack = [&](const Json& path) {
+            ASSERT_TRUE(path.is_string());
+            const CommandResult again =
+                RunCliphost("describe -q " + Quoted(path.get<std::string>()));
+            EXPECT_EQ(again.status, 0) << again.out;
+        };
+        const auto json = [&](const std::string& call) {
+            return Json::parse(RunCommand(Program() + " " + call).out);
+        };
+        takesBack(json("scan --json " + Out("in"))["movies"][0]);
+        takesBack(json("samples --json " + movie)["movie"]);
+        takesBack(json("formats --json " + movie)["movie"]);
+        takesBack(json("params --json " + movie)["movie"]);
+        const Json described =
+            json("describe --json " + movie + " --out-dir " + Quoted(Out("out")))[0];
+        takesBack(described["movie"]);
+        EXPECT_EQ(RunCliphost("describe -q " + Out("in") + " --aaf " +
+                              Quoted(described["aaf"].get<std::string>()))
+                      .status,
+                  2)
+            << "the file is there, so that this names no folder";
+        std::filesystem::remove_all(folder() / "in");
+        std::filesystem::remove_all(folder() / "out");
+    }
+    EXPECT_EQ(RunCliphost("describe -q file://server/a.mov").status, 2);
+}
+
+TEST_F(ProgramCalls, TellInTheirHelpHowJsonNamesPathsThatAreNoText) {
+    for (const char* const verb : {"scan", "describe", "samples", "formats", "params", "plugin"}) {
+        ExpectSays(RunCliphost(std::string(verb) + " --help"), 0, "file:///a%FF.mov");
+    }
+}
+
+TEST_F(ProgramCalls, ShowNamesWithControlsEscaped) {
+    std::filesystem::create_directory(folder() / "in");
+    const auto movie = Quoted(Copy("h264_with_aac.mov", "in/a\nb\x1B[2J\xFF.mov"));
+    const std::string shown = "/in/a\\nb\\x1B[2J\\xFF.mov";
+    Write(movies::Bytes{'x'}, "in/bad\x1B.mov");
+    for (const std::string& call :
+         {"scan " + Out("in"), "describe " + movie, "describe -q " + Out("in"), "samples " + movie,
+          "formats " + movie, "params " + movie, "frame -o " + Out("a.raw") + " " + movie + "x",
+          "frame --frame 999 -o " + Out("a.raw") + " " + movie,
+          "frame -v -o " + Out("a.raw") + " " + movie,
+          "audio -o " + Out("in/c\x1B.wav") + " " + movie}) {
+        const CommandResult ran = RunCliphost(call);
+        EXPECT_EQ(ran.out.find('\x1B'), std::string::npos) << ran.out;
+        EXPECT_EQ(ran.out.find('\xFF'), std::string::npos) << ran.out;
+    }
+    ExpectSays(RunCliphost("describe -q " + movie), 0, shown);
+    ExpectSays(RunCliphost("describe -q " + Out("in")), 1, "/in/bad\\x1B.mov: ");
+    ExpectSays(RunCliphost(Quoted("a\x1B"
+                                  "b")),
+               2, "'a\\x1Bb' is no verb");
+}
+
 TEST_F(ProgramCalls, LeaveNothingBehindWhenInterrupted) {
     const auto movie = MadeMovie("prores_with_pcm.mov").string();
     // A raw file is open all the while the frames are read.

@@ -55,17 +55,30 @@ bool IsControl(char32_t c) {
     return false;
 }
 
-std::string Printable(std::string_view utf8) {
+namespace {
+
+std::string Escaped(std::string_view utf8, bool keepsLineEnds) {
     std::string out;
     out.reserve(utf8.size());
     for (const char32_t c : FromUtf8(utf8)) {
-        if (IsControl(c) || IsSurrogate(c)) {
+        const bool isKept = keepsLineEnds && c == U'\n';
+        if (!isKept && (IsControl(c) || IsSurrogate(c))) {
             AppendEscaped(c, out);
         } else {
             out += ToUtf8Lossy(std::u32string_view(&c, 1));
         }
     }
     return out;
+}
+
+}  // namespace
+
+std::string Printable(std::string_view utf8) {
+    return Escaped(utf8, false);
+}
+
+std::string PrintableLines(std::string_view utf8) {
+    return Escaped(utf8, true);
 }
 
 }  // namespace host::text

@@ -16,5 +16,7 @@ bool IsControl(char32_t c);
 // are shown as a shell's $'...' takes them: "\n", "\t", "\r", else "\x1B" for
 // each byte.
 std::string Printable(std::string_view utf8);
+// The same for a text of several lines, which it stays.
+std::string PrintableLines(std::string_view utf8);
 
 }  // namespace host::text

@@ -43,6 +43,24 @@ TEST(OptionChecks, TakeFrameRatesThatAMovieCanHave) {
     }
 }
 
+TEST(OptionChecks, TakeAFileUrlAsThePathThatItNames) {
+    CLI::App app;
+    std::filesystem::path path;
+    std::vector<std::string> texts;
+    bool flag = false;
+    app.add_option("path", path);
+    app.add_option("--text", texts)->check([](const std::string& text) {
+        return text == "/b" || text == "plain" ? "" : "the check comes first";
+    });
+    app.add_flag("--flag", flag);
+    cliphost::TakeFileUrls(app);
+    app.parse("file:///a%20b/caf%E9.mov --flag --text file:///b --text plain");
+    EXPECT_EQ(path.native(), "/a b/caf\xE9.mov");
+    EXPECT_EQ(texts, (std::vector<std::string>{"/b", "plain"}));
+    EXPECT_THROW(app.parse("file://server/a.mov"), CLI::ValidationError);
+    EXPECT_THROW(app.parse("file:///a%zz.mov"), CLI::ValidationError);
+}
+
 TEST(OptionChecks, RefuseAnOutputThatIsTheMovieByAnyName) {
     const TestFolder folder;
     WriteFile(folder / "a.mov", "movie");

@@ -26,6 +26,11 @@ TEST(HostPath, GoesBothWaysWithBytesThatAreNoUtf8) {
     EXPECT_EQ(original, path);
 }
 
+TEST(HostPath, IsShownOnOneLineWithControlsAndForeignBytesEscaped) {
+    EXPECT_EQ("/a b/caf\xC3\xA9.mov", host::DisplayPath("/a b/caf\xC3\xA9.mov"));
+    EXPECT_EQ("a\\nb\\x1B[2J\\xFF.mov", host::DisplayPath("a\nb\x1B[2J\xFF.mov"));
+}
+
 TEST(HostPath, RefusesTextsThatNameNoFile) {
     std::filesystem::path path;
     EXPECT_EQ(NCF_E_POINTER, host::PathFrom(nullptr, path));

@@ -32,6 +32,10 @@ TEST(Printable, EscapesEndsOfLinesAndTurnsOfDirection) {
     EXPECT_EQ(Printable("\xE2\x81\xA6"), "\\xE2\\x81\\xA6");
 }
 
+TEST(Printable, KeepsTheLinesOfATextOfSeveral) {
+    EXPECT_EQ(host::text::PrintableLines("a\n b\x1B[2J\r\n"), "a\n b\\x1B[2J\\r\n");
+}
+
 TEST(Printable, EscapesBytesThatAreNoText) {
     EXPECT_EQ(Printable("caf\xE9.mov"), "caf\\xE9.mov");
     EXPECT_EQ(Printable("\x9B"

@@ -1,0 +1,20 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+namespace cliphost {
+
+// A path as programs read it from --json: the path itself, or its file URL when
+// it holds bytes that are no UTF-8, which JSON has no place for. Every verb
+// takes either back.
+std::string MachinePath(const std::filesystem::path& path);
+
+// What to say of it where --json is explained.
+inline constexpr char kJsonHelp[] =
+    "As JSON; a path that is no UTF-8 stands there as a file URL (file:///a%FF.mov), which every "
+    "verb takes in place of a path";
+
+}  // namespace cliphost

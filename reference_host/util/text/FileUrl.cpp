@@ -1,0 +1,85 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/util/text/FileUrl.h"
+
+namespace host::text {
+
+namespace {
+
+constexpr std::string_view kScheme = "file://";
+constexpr std::string_view kThisMachine = "localhost";
+constexpr char kDigits[] = "0123456789ABCDEF";
+
+bool IsUnreserved(unsigned char byte) {
+    return (byte >= 'A' && byte <= 'Z') || (byte >= 'a' && byte <= 'z') ||
+           (byte >= '0' && byte <= '9') || byte == '-' || byte == '.' || byte == '_' || byte == '~';
+}
+
+int DigitValue(char c) {
+    if (c >= '0' && c <= '9') {
+        return c - '0';
+    }
+    const char upper = static_cast<char>(c & ~0x20);
+    return upper >= 'A' && upper <= 'F' ? upper - 'A' + 10 : -1;
+}
+
+}  // namespace
+
+std::string PercentEncoded(std::string_view bytes) {
+    std::string out;
+    for (const char byte : bytes) {
+        const auto value = static_cast<unsigned char>(byte);
+        if (IsUnreserved(value) || byte == '/') {
+            out.push_back(byte);
+        } else {
+            out += {'%', kDigits[value >> 4], kDigits[value & 15]};
+        }
+    }
+    return out;
+}
+
+bool PercentDecoded(std::string_view text, std::string& bytes) {
+    std::string out;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        if (text[i] != '%') {
+            out.push_back(text[i]);
+            continue;
+        }
+        const int high = i + 2 < text.size() ? DigitValue(text[i + 1]) : -1;
+        const int low = high < 0 ? -1 : DigitValue(text[i + 2]);
+        if (low < 0) {
+            return false;
+        }
+        out.push_back(static_cast<char>(high << 4 | low));
+        i += 2;
+    }
+    bytes = std::move(out);
+    return true;
+}
+
+std::string FileUrl(std::string_view path) {
+    return std::string(kScheme) + PercentEncoded(path);
+}
+
+bool IsFileUrl(std::string_view text) {
+    return text.substr(0, kScheme.size()) == kScheme;
+}
+
+bool PathOfFileUrl(std::string_view url, std::string& path) {
+    if (!IsFileUrl(url)) {
+        return false;
+    }
+    url.remove_prefix(kScheme.size());
+    if (url.substr(0, kThisMachine.size()) == kThisMachine) {
+        url.remove_prefix(kThisMachine.size());
+    }
+    std::string decoded;
+    if (url.empty() || url[0] != '/' || !PercentDecoded(url, decoded) ||
+        decoded.find('\0') != std::string::npos) {
+        return false;
+    }
+    path = std::move(decoded);
+    return true;
+}
+
+}  // namespace host::text
