@@ -73,9 +73,8 @@ void DescribeFolder(benchmark::State& state) {
     options.programFolder =
         std::filesystem::read_symlink("/proc/self/exe").parent_path().parent_path();
     cliphost::Session session(options);
-    const auto path = cliphost::PathForModule(Folder().Path());
     for (auto _ : state) {
-        const cliphost::FolderClips clips(session, path.get());
+        const cliphost::FolderClips clips(session, Folder().Path());
         for (const cliphost::FolderClip& clip : clips.clips()) {
             const auto description =
                 cliphost::DescribeFromList(session, clips.list(), clip.index, clip.path);

@@ -5,9 +5,13 @@
 
 #include <fmt/format.h>
 
+#include <cerrno>
+#include <cstdlib>
+#include <fstream>
 #include <system_error>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/UnfinishedFile.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -22,24 +26,49 @@ using PinTimeFunction = HRESULT (*)(const aafTimeStamp_t* time, const aafUID_t* 
 
 constexpr aafUID_t kPinnedGeneration = ncfGuid("00000000-0000-0000-0000-000000000001");
 
-// The file takes its place by its name, so a device or a folder there would be
-// lost, or stand in the way.
+// The file takes its place by its name, so a folder there would stand in the way.
 void CheckPlace(const std::filesystem::path& path) {
-    std::error_code ignored;
-    const auto there = std::filesystem::status(path, ignored);
-    if (std::filesystem::exists(there) && !std::filesystem::is_regular_file(there)) {
-        throw Failure(kExitCaller, path,
-                      fmt::format("not saved: a {} is there",
-                                  std::filesystem::is_directory(there) ? "folder" : "device"),
-                      "name another file");
+    std::error_code error;
+    const auto there = std::filesystem::status(path, error);
+    if (there.type() == std::filesystem::file_type::none) {
+        throw Failure(kExitCaller, path, "not saved: " + error.message());
     }
-    const std::filesystem::path folder = std::filesystem::absolute(path, ignored).parent_path();
-    if (!std::filesystem::is_directory(folder, ignored)) {
+    if (std::filesystem::is_directory(there)) {
+        throw Failure(kExitCaller, path, "not saved: a folder is there", "name another file");
+    }
+    const std::filesystem::path folder = std::filesystem::absolute(path, error).parent_path();
+    if (!std::filesystem::is_directory(folder, error)) {
         throw Failure(kExitCaller, path,
                       fmt::format("not saved: there is no folder {}", DisplayPath(folder)),
                       "make it first");
     }
 }
+
+// A folder of our own, gone with what is in it.
+class ScratchFolder {
+public:
+    ScratchFolder() : path_(std::filesystem::temp_directory_path() / "cliphost-XXXXXX") {
+        std::string name = path_.native();
+        if (mkdtemp(name.data()) == nullptr) {
+            const int reason = errno;
+            throw Failure(kExitCaller, path_.parent_path(),
+                          "no folder can be made there: " + std::generic_category().message(reason),
+                          "name another one in TMPDIR");
+        }
+        path_ = name;
+    }
+    ~ScratchFolder() {
+        std::error_code ignored;
+        std::filesystem::remove_all(path_, ignored);
+    }
+    ScratchFolder(const ScratchFolder&) = delete;
+    ScratchFolder& operator=(const ScratchFolder&) = delete;
+
+    std::filesystem::path operator/(const char* name) const { return path_ / name; }
+
+private:
+    std::filesystem::path path_;
+};
 
 }  // namespace
 
@@ -72,7 +101,24 @@ bool AafLibrary::PinTime(const aafTimeStamp_t& time) {
     return pin && pin(&time, &kPinnedGeneration) >= 0;
 }
 
+// The library writes files alone, so a device takes the bytes of one.
+void AafLibrary::SaveToDevice(IAAFFile* file, const std::filesystem::path& device) const {
+    OutputFile output(device);
+    const ScratchFolder scratch;
+    Save(file, scratch / "clip.aaf");
+    std::ifstream saved(scratch / "clip.aaf", std::ios::binary);
+    char piece[65536];
+    while (saved.read(piece, sizeof piece), saved.gcount() > 0) {
+        output.Write(piece, static_cast<std::size_t>(saved.gcount()));
+    }
+    output.Finish();
+}
+
 void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
+    if (OutputFile::IsDevice(path)) {
+        SaveToDevice(file, path);
+        return;
+    }
     const auto openNew = find<AAFFileOpenNewModifyExFunction>("AAFFileOpenNewModifyEx");
     aafCharacter company[] = L"Cliphost";
     aafCharacter product[] = L"cliphost";

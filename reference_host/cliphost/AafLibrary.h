@@ -27,7 +27,8 @@ public:
     bool PinTime(const aafTimeStamp_t& time);
 
     // Saves a copy of a file with the published calls. An existing file is
-    // replaced once the new one is whole. Throws a Failure.
+    // replaced once the new one is whole; a device is written. Throws a Failure,
+    // or ReaderGone.
     void Save(IAAFFile* file, const std::filesystem::path& path) const;
     // Opens a saved file for reading. Throws a Failure.
     AafRef<IAAFFile> Open(const std::filesystem::path& path) const;
@@ -37,6 +38,7 @@ public:
     std::string Version() const;
 
 private:
+    void SaveToDevice(IAAFFile* file, const std::filesystem::path& device) const;
     template <class Function>
     Function find(const char* name) const {
         return reinterpret_cast<Function>(library_.Find(name));

@@ -9,6 +9,7 @@
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/SoundReader.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -28,34 +29,72 @@ struct AudioOptions {
 constexpr std::uint64_t kBlock = 65536;  // samples of each channel read at a time
 
 std::uint64_t WantedCount(const AudioOptions& options, const SoundReader& sound) {
+    if (sound.Count() == 0) {
+        throw Failure(kExitFile, options.movie, "its sound has no samples");
+    }
     if (options.start >= sound.Count()) {
         throw Failure(kExitCaller, options.movie,
                       fmt::format("there is no sample {} of sound", options.start),
-                      fmt::format("it has {}, from 0 on", sound.Count()));
+                      NumberedFromZero(sound.Count(), "sample"));
     }
     const std::uint64_t left = sound.Count() - options.start;
     if (options.count && *options.count > left) {
-        Notice(
-            "cliphost: {}: only {} samples follow sample {}; all of them are "
-            "written\n",
-            DisplayPath(options.movie), left, options.start);
+        Notice("cliphost: {}: the sound ends {} behind sample {}; what there is is written\n",
+               DisplayPath(options.movie), Counted(left, "sample"), options.start);
     }
     return std::min(options.count.value_or(left), left);
 }
 
-// The number of samples that came as silence since they could not be read.
-std::uint64_t Copy(SoundReader& sound, std::uint64_t start, std::uint64_t count,
-                   OutputFile& output) {
+// Writes a file of sound from its first sample that could be read on: silence in
+// place of what can't be read is held back until something follows it, so that
+// none of it is written where nothing does.
+class SoundCopy {
+public:
+    SoundCopy(SoundReader& sound, const std::vector<unsigned char>& header, OutputFile& output)
+        : sound_(sound), header_(header), output_(output) {}
+
+    // Returns the number of samples that are silence, which may be all.
+    std::uint64_t Run(std::uint64_t start, std::uint64_t count);
+
+private:
+    void Write(const SoundReader::Block& block);
+
+    SoundReader& sound_;
+    const std::vector<unsigned char>& header_;
+    OutputFile& output_;
+    bool isBegun_ = false;
+    std::uint64_t heldBytes_ = 0;
+};
+
+std::uint64_t SoundCopy::Run(std::uint64_t start, std::uint64_t count) {
     std::uint64_t silent = 0;
     Progress progress("sound", static_cast<std::size_t>((count + kBlock - 1) / kBlock));
     for (std::uint64_t done = 0; done < count; done += kBlock) {
         progress.Step(fmt::format("{} of {} samples", done, count));
         const std::uint64_t now = std::min(kBlock, count - done);
-        const SoundReader::Block block = sound.Read(start + done, now);
+        const SoundReader::Block block = sound_.Read(start + done, now);
         silent += block.isSilence ? now : 0;
-        output.Write(block.bytes, block.size);
+        Write(block);
     }
     return silent;
+}
+
+void SoundCopy::Write(const SoundReader::Block& block) {
+    if (!isBegun_ && block.isSilence) {
+        heldBytes_ += block.size;
+        return;
+    }
+    if (!isBegun_) {
+        isBegun_ = true;
+        output_.Write(header_.data(), header_.size());
+        const std::vector<unsigned char> silence(65536);
+        for (std::uint64_t left = heldBytes_; left > 0;) {
+            const std::uint64_t now = std::min<std::uint64_t>(left, silence.size());
+            output_.Write(silence.data(), static_cast<std::size_t>(now));
+            left -= now;
+        }
+    }
+    output_.Write(block.bytes, block.size);
 }
 
 int WriteSound(Essence& essence, const AudioOptions& options) {
@@ -74,15 +113,19 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     const std::vector<unsigned char> header = WavHeader(form, count);
     if (header.empty()) {
         throw Failure(kExitFile, options.movie,
-                      fmt::format("{} channels at {} Hz are no form of a WAV file", form.channels,
-                                  form.rate));
+                      fmt::format("no WAV file holds sound of {} at {} Hz",
+                                  Counted(form.channels, "channel"), form.rate));
     }
     RefuseOutputOntoMovie(options.output, options.movie);
     std::uint64_t silent = 0;
     try {
         OutputFile output(options.output);
-        output.Write(header.data(), header.size());
-        silent = Copy(sound, options.start, count, output);
+        silent = SoundCopy(sound, header, output).Run(options.start, count);
+        if (silent == count) {
+            throw Failure(kExitFile, options.movie,
+                          fmt::format("track {}: none of its samples from {} to {} could be read",
+                                      track.number, options.start, options.start + count - 1));
+        }
         if (WavNeedsPadding(form, count)) {
             output.Write("", 1);
         }
@@ -91,12 +134,12 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
         return kExitFine;
     }
     if (!OutputFile::IsStandardOutput(options.output)) {
-        fmt::print("{}: {} samples, {} channel{}, 24 bits at {} Hz\n", DisplayPath(options.output),
-                   count, form.channels, form.channels == 1 ? "" : "s", form.rate);
+        fmt::print("{}: {}, {}, 24 bits at {} Hz\n", DisplayPath(options.output),
+                   Counted(count, "sample"), Counted(form.channels, "channel"), form.rate);
     }
     if (silent > 0) {
-        Notice("cliphost: {}: {} of {} samples could not be read and are silence\n",
-               DisplayPath(options.movie), silent, count);
+        Notice("cliphost: {}: silence stands in place of {} of {}, which could not be read\n",
+               DisplayPath(options.movie), silent, Counted(count, "sample"));
     }
     return silent == 0 ? kExitFine : kExitFile;
 }

@@ -123,7 +123,7 @@ ClipParameters::ClipParameters(Session& session, std::filesystem::path movie,
         result = host::Query(mapping.get(), parameters_);
     }
     if (result < 0) {
-        throw Failure(kExitFile, ProblemWith(session_, movie_, result));
+        throw Failure(ProblemWith(session_, movie_, result));
     }
 }
 

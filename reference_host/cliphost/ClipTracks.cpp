@@ -69,6 +69,16 @@ std::string RateText(const ClipTrack& track) {
                : "unknown";
 }
 
+std::string RateWords(const ClipTrack& track) {
+    const char* const thing = track.kind == TrackKind::Sound ? "sample" : "frame";
+    if (track.RateAsNumber() <= 0.0) {
+        return fmt::format("{}s a second not known", thing);
+    }
+    const std::string number =
+        track.rate.denominator == 1 ? fmt::format("{}", track.rate.numerator) : RateText(track);
+    return fmt::format("{} {}{} a second", number, thing, number == "1" ? "" : "s");
+}
+
 std::vector<ClipTrack> ReadClipTracks(IAAFFile* file) {
     std::vector<ClipTrack> tracks;
     const auto descriptors = FileDescriptors(file);

@@ -29,6 +29,8 @@ struct ClipTrack {
 
 // "30000/1001", or "unknown".
 std::string RateText(const ClipTrack& track);
+// "25 frames a second", "48000 samples a second", or that this is not known.
+std::string RateWords(const ClipTrack& track);
 
 // The tracks of a described clip in the host's order: the picture, its alpha
 // where the clip shows one, the sounds. The description is where a host learns

@@ -18,6 +18,7 @@
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/TurnOption.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -94,8 +95,8 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     output.Write(png.data(), png.size());
     output.Finish();
     if (!OutputFile::IsStandardOutput(options.output)) {
-        fmt::print("{}: {} of {} frames\n", DisplayPath(options.output), frames.size() - failed,
-                   reader.Count());
+        fmt::print("{}: {} of {}\n", DisplayPath(options.output), frames.size() - failed,
+                   Counted(reader.Count(), "frame"));
     }
     return failed == 0 ? kExitFine : kExitFile;
 }
@@ -112,7 +113,8 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
         "With --use-alpha a checkerboard shows through what is transparent.");
     auto options = std::make_shared<ContactOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("-o,--output", options->output, "The PNG file")->required();
+    verb->add_option("-o,--output", options->output, "The PNG file, or - for standard output")
+        ->required();
     verb->add_option("--frames", options->frames, "How many")
         ->check(CLI::Range(1, 1000))
         ->capture_default_str();

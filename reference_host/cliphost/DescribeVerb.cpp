@@ -3,6 +3,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <set>
 
 #include "reference_host/cliphost/AafTree.h"
@@ -12,6 +13,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
@@ -43,7 +45,7 @@ private:
     // Does a step; what it fails with is told, and the next one goes on.
     template <class Step>
     void GoOnAfterFailure(const std::filesystem::path& path, const Step& step);
-    void Refuse(const std::filesystem::path& path, const Problem& problem);
+    void Refuse(const std::filesystem::path& path, const Problem& problem, int status);
     std::filesystem::path TargetFor(const std::filesystem::path& movie);
 
     Session& session_;
@@ -52,7 +54,7 @@ private:
     nlohmann::ordered_json json_ = nlohmann::ordered_json::array();
     int described_ = 0;
     int failed_ = 0;
-    int statusOfFailure_ = kExitFile;
+    int status_ = kExitFine;  // the highest of all failures
 };
 
 int DescribeRun::Run() {
@@ -72,11 +74,10 @@ int DescribeRun::Run() {
     }
     if (options_.json) {
         PrintJson(json_);
-    } else if (described_ + failed_ != 1) {
+    } else if (described_ + failed_ != 1 && !OutputFile::IsStandardOutput(options_.aafFile)) {
         fmt::print("{} described, {} not\n", described_, failed_);
     }
-    const bool isOne = described_ + failed_ == 1;
-    return failed_ == 0 ? kExitFine : isOne ? statusOfFailure_ : kExitFile;
+    return status_;
 }
 
 template <class Step>
@@ -84,13 +85,15 @@ void DescribeRun::GoOnAfterFailure(const std::filesystem::path& path, const Step
     try {
         step();
     } catch (const Failure& failure) {
-        statusOfFailure_ = failure.status();
-        Refuse(path, failure.problem());
+        Refuse(path, failure.problem(), failure.status());
+    } catch (const ReaderGone&) {
+        // It has seen enough.
     }
 }
 
-void DescribeRun::Refuse(const std::filesystem::path& path, const Problem& problem) {
+void DescribeRun::Refuse(const std::filesystem::path& path, const Problem& problem, int status) {
     ++failed_;
+    status_ = std::max(status_, status);
     TellProblem(problem, session_.verbosity());
     nlohmann::ordered_json entry = {{"movie", MachinePath(path)}};
     AddProblem(problem, entry);
@@ -100,9 +103,15 @@ void DescribeRun::Refuse(const std::filesystem::path& path, const Problem& probl
 void DescribeRun::DescribeFolder(const std::filesystem::path& folder) {
     const auto path = PathForModule(folder);
     if (!IsClaimed(session_, path.get())) {
-        throw Failure(kExitFile, folder, "not claimed: no file there is named *.mov");
+        throw Failure(kExitFile, NotClaimed(folder));
     }
-    const FolderClips clips(session_, path.get());
+    const FolderClips clips(session_, folder);
+    for (const std::filesystem::path& name : clips.others().withBackslash) {
+        Refuse(name, BackslashProblem(name), kExitCaller);
+    }
+    if (const Problem leftOut = LeftOut(folder, clips.others())) {
+        TellProblem(leftOut, session_.verbosity());
+    }
     Progress progress("describing", clips.clips().size());
     for (const FolderClip& clip : clips.clips()) {
         progress.Step(DisplayPath(clip.path.filename()));
@@ -114,7 +123,7 @@ void DescribeRun::DescribeFolder(const std::filesystem::path& folder) {
 
 void DescribeRun::Take(const Description& description) {
     if (!description.file) {
-        Refuse(description.movie, description.problem);
+        Refuse(description.movie, description.problem, StatusOf(description.problem));
         return;
     }
     std::filesystem::path saved;
@@ -125,11 +134,15 @@ void DescribeRun::Take(const Description& description) {
         for (const std::filesystem::path& other : options_.paths) {
             RefuseOutputOntoMovie(saved, other);
         }
+        const bool isDevice = OutputFile::IsDevice(saved);
         session_.aaf().Save(description.file.get(), saved);
         // What is shown is what any reader of the saved file finds.
-        shown = session_.aaf().Open(saved);
+        shown = isDevice ? shown : session_.aaf().Open(saved);
     }
     ++described_;
+    if (OutputFile::IsStandardOutput(saved)) {
+        return;  // what is shown would be in the midst of the file
+    }
     const TreeNode tree = ReadTree(shown.get());
     if (options_.json) {
         nlohmann::ordered_json entry = {{"movie", MachinePath(description.movie)}};
@@ -171,7 +184,8 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
     verb->add_option("paths", options->paths, "Movies and folders")->required();
-    auto* const aaf = verb->add_option("--aaf", options->aafFile, "Save the one movie's file here");
+    auto* const aaf = verb->add_option("--aaf", options->aafFile,
+                                       "Save the one movie's file here; - for standard output");
     verb->add_option("--out-dir", options->outFolder, "Save every movie's file in this folder")
         ->excludes(aaf);
     verb->add_flag("--json", options->json, kJsonHelp);
@@ -183,6 +197,9 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         if (!options->aafFile.empty() &&
             (options->paths.size() != 1 || std::filesystem::is_directory(options->paths[0]))) {
             throw Failure(kExitCaller, "--aaf", "it takes one movie", "use --out-dir for several");
+        }
+        if (options->json && OutputFile::IsStandardOutput(options->aafFile)) {
+            throw Failure(kExitCaller, "--aaf", "standard output takes the JSON", "name a file");
         }
         SessionOptions withTime = session;
         withTime.pinTime = *pinned;

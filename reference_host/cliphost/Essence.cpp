@@ -36,7 +36,7 @@ Essence::Essence(Session& session, std::filesystem::path movie, const ParameterO
     host::Ref<NMA::IMediaContainer3> container;
     const NCFRESULT opened = OpenContainer(session_, movie_, container);
     if (opened < 0) {
-        throw Failure(kExitFile, ProblemWith(session_, movie_, opened));
+        throw Failure(ProblemWith(session_, movie_, opened));
     }
     const Description description = DescribeContainer(session_, container.get(), movie_);
     undescribed_ = description.problem;
@@ -51,8 +51,7 @@ void Essence::Map(NMA::IMediaContainer3& container) {
     const NCFRESULT mapped = container.GetSampleMapping(map_.Out());
     const NCFRESULT provided = mapped < 0 ? mapped : Ask(map_.get(), provider_);
     if (provided < 0) {
-        throw Failure(kExitFile,
-                      undescribed_ ? undescribed_ : ProblemWith(session_, movie_, provided));
+        throw Failure(undescribed_ ? undescribed_ : ProblemWith(session_, movie_, provided));
     }
 }
 
@@ -83,7 +82,7 @@ std::vector<ClipTrack> Essence::FindTracks() {
     }
     session_.TakeNotices();
     if (tracks.empty()) {
-        throw Failure(kExitFile, undescribed_);
+        throw Failure(undescribed_);
     }
     return tracks;
 }
@@ -141,10 +140,11 @@ const ClipTrack& Essence::Track(std::optional<ncfUInt32> number, TrackKind kind)
 std::string Essence::TrackList() const {
     std::string list;
     for (const ClipTrack& track : tracks_) {
-        list += fmt::format("{}{} {}", list.empty() ? "its tracks are " : ", ", track.number,
-                            NameOf(track.kind));
+        list += fmt::format("{}{} {}", list.empty() ? "" : ", ", track.number, NameOf(track.kind));
     }
-    return list.empty() ? "it has no tracks" : list;
+    return tracks_.empty()       ? "it has no tracks"
+           : tracks_.size() == 1 ? "its one track is " + list
+                                 : "its tracks are " + list;
 }
 
 // The module keeps every picture track of a movie and tells the host of the

@@ -44,6 +44,9 @@ public:
     const ClipTrack& Track(std::optional<ncfUInt32> number, TrackKind kind) const;
     const ClipTrack* First(TrackKind kind) const;
 
+    // All tracks by number and kind, for people.
+    std::string TrackList() const;
+
     // Why nothing of a track can be delivered; nothing when it can.
     Problem Obstacle(const ClipTrack& track);
     // Throws a Failure with the obstacle.
@@ -55,7 +58,6 @@ public:
 private:
     void Map(NMA::IMediaContainer3& container);
     std::vector<ClipTrack> FindTracks();
-    std::string TrackList() const;
 
     Session& session_;
     std::filesystem::path movie_;

@@ -10,10 +10,16 @@
 
 namespace cliphost {
 
-// Exit statuses of the program.
+// Exit statuses of the program. One kind of failure has one of them, in each verb
+// and for one movie as for many; of several failures the highest is given.
 inline constexpr int kExitFine = 0;
 inline constexpr int kExitFile = 1;    // the file's fault
 inline constexpr int kExitCaller = 2;  // the caller's fault
+
+// Whose fault a problem with a file is: the caller's where the system does not
+// open it, such as for want of permission, and where it is no file at all; else
+// that of what it holds.
+int StatusOf(const Problem& problem);
 
 // Ends a verb with what the user and programs are told. what() is the line.
 class Failure : public std::runtime_error {
@@ -23,6 +29,8 @@ public:
     // Of a file, a folder or an option.
     Failure(int status, std::filesystem::path subject, std::string reason, std::string hint = {})
         : Failure(status, Problem{std::move(subject), std::move(reason), std::move(hint)}) {}
+    // Of a file: with the status that goes with it.
+    explicit Failure(Problem problem) : Failure(StatusOf(problem), problem) {}
     // Of none of these.
     Failure(int status, std::string reason) : Failure(status, {}, std::move(reason)) {}
 

@@ -3,15 +3,28 @@
 
 #include "reference_host/cliphost/FolderClips.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
+#include <set>
+#include <string_view>
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/Failure.h"
-#include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/util/text/Paths.h"
 
 namespace cliphost {
 namespace {
+
+// The one ending that the module looks for in a folder.
+constexpr std::string_view kClaimedEnding = ".mov";
+// Endings of movies, in small letters.
+constexpr std::string_view kMovieEndings[] = {".mov",  ".mp4",   ".m4v", ".mpg", ".mpe",
+                                              ".mpeg", ".m2t",   ".3gp", ".3g2", ".qt",
+                                              ".moov", ".movie", ".avi", ".dv"};
+constexpr std::size_t kMostNames = 3;  // shown of those left out
 
 void Check(NCFRESULT result, const char* what) {
     if (result < 0) {
@@ -26,7 +39,95 @@ host::Ref<NMA::IMediaVolume> Volume(Session& session) {
     return volume;
 }
 
+std::string InSmallLetters(std::string text) {
+    for (char& c : text) {
+        c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+    }
+    return text;
+}
+
+bool HasMovieEnding(const std::filesystem::path& name) {
+    const std::string ending = InSmallLetters(name.extension().native());
+    return std::find(std::begin(kMovieEndings), std::end(kMovieEndings), ending) !=
+           std::end(kMovieEndings);
+}
+
+// A name for the movie that the module claims and that is not taken.
+std::filesystem::path ClaimedName(const std::filesystem::path& movie) {
+    std::error_code ignored;
+    std::filesystem::path name = movie;
+    name.replace_extension(kClaimedEnding);
+    if (std::filesystem::exists(name, ignored)) {
+        name = movie;
+        name += kClaimedEnding;
+    }
+    return name.filename();
+}
+
+std::string NamesOf(const std::vector<std::filesystem::path>& movies) {
+    std::string names;
+    for (std::size_t i = 0; i < std::min(movies.size(), kMostNames); ++i) {
+        names += (i == 0 ? "" : ", ") + host::DisplayPath(movies[i].filename());
+    }
+    return movies.size() > kMostNames ? names + ", ..." : names;
+}
+
+std::string HowToName(const std::vector<std::filesystem::path>& movies) {
+    return fmt::format(
+        "rename {} so that the name ends in .mov, in small letters, such as {}; or give the file "
+        "itself to `cliphost describe`",
+        movies.size() == 1 ? "it" : "each", host::DisplayPath(ClaimedName(movies[0])));
+}
+
 }  // namespace
+
+OtherMovies FindOtherMovies(const std::filesystem::path& folder) {
+    OtherMovies others;
+    std::error_code error;
+    std::filesystem::directory_iterator entry(folder, error);
+    for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error)) {
+        const std::filesystem::path name = entry->path().filename();
+        std::error_code ignored;
+        if (!HasMovieEnding(name) || !entry->is_regular_file(ignored)) {
+            continue;
+        }
+        if (name.extension() != kClaimedEnding) {
+            others.otherEnding.push_back(entry->path());
+        } else if (host::text::HoldsBackslash(name)) {
+            others.withBackslash.push_back(entry->path());
+        }
+    }
+    if (error) {
+        throw Failure(kExitCaller, folder, "the folder can't be read: " + error.message());
+    }
+    std::sort(others.otherEnding.begin(), others.otherEnding.end());
+    std::sort(others.withBackslash.begin(), others.withBackslash.end());
+    return others;
+}
+
+Problem NotClaimed(const std::filesystem::path& folder) {
+    const std::vector<std::filesystem::path> movies = FindOtherMovies(folder).otherEnding;
+    if (movies.empty()) {
+        return {folder, "not claimed: no file there is named *.mov", {}};
+    }
+    return {folder,
+            fmt::format("not claimed: no file there is named *.mov, though it holds {} with {}: {}",
+                        Counted(movies.size(), "movie"),
+                        movies.size() == 1 ? "another ending" : "other endings", NamesOf(movies)),
+            HowToName(movies)};
+}
+
+Problem LeftOut(const std::filesystem::path& folder, const OtherMovies& others) {
+    const std::vector<std::filesystem::path>& movies = others.otherEnding;
+    if (movies.empty()) {
+        return {};
+    }
+    return {folder,
+            fmt::format("{} {} left out, since the module takes *.mov alone: {}",
+                        Counted(movies.size(), "movie"), movies.size() == 1 ? "is" : "are",
+                        NamesOf(movies)),
+            HowToName(movies)};
+}
 
 bool IsClaimed(Session& session, INCFString* folder) {
     return Volume(session)->IsMediaVolume(folder) == 1;
@@ -38,17 +139,32 @@ host::Ref<NMA::IVolumeInfo> VolumeInfoOf(Session& session, INCFString* folder) {
     return info;
 }
 
-FolderClips::FolderClips(Session& session, INCFString* folder) {
+FolderClips::FolderClips(Session& session, const std::filesystem::path& folder)
+    : others_(FindOtherMovies(folder)) {
+    const auto path = PathForModule(folder);
+    std::filesystem::path parent;
+    Check(host::PathFrom(path.get(), parent), "a path that no folder can have");
     host::Ref<NMA::IMediaFormat> format;
-    Check(Volume(session)->GetMediaFormat(folder, format.Out()), "no media format");
+    Check(Volume(session)->GetMediaFormat(path.get(), format.Out()), "no media format");
     Check(format->GetAAFClips(list_.Out()), "no list of movies");
+    // What a backslash in a name makes of it: a path into another folder, or
+    // that of another movie.
+    std::set<std::filesystem::path> fromBackslash;
+    for (const std::filesystem::path& movie : others_.withBackslash) {
+        std::filesystem::path turned;
+        const auto text = host::ModulePath(parent / movie.filename());
+        Check(host::PathFrom(text.get(), turned), "a path that no file can have");
+        fromBackslash.insert(turned);
+    }
     const ncfSInt32 count = list_->GetCount();
     for (ncfSInt32 i = 0; i < count; ++i) {
-        const auto path = host::MakeString(std::string_view());
+        const auto text = host::MakeString(std::string_view());
         FolderClip clip{i, {}};
-        Check(list_->GetClipPath(i, path.get()), "no path of a movie");
-        Check(host::PathFrom(path.get(), clip.path), "a path that no file can have");
-        clips_.push_back(clip);
+        Check(list_->GetClipPath(i, text.get()), "no path of a movie");
+        Check(host::PathFrom(text.get(), clip.path), "a path that no file can have");
+        if (fromBackslash.erase(clip.path) == 0) {
+            clips_.push_back(clip);
+        }
     }
     std::sort(clips_.begin(), clips_.end(),
               [](const FolderClip& a, const FolderClip& b) { return a.path < b.path; });

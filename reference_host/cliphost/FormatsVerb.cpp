@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -76,12 +77,13 @@ void AddSound(Essence& essence, const ClipTrack& track, Json& json) {
         const bool isLittle = order == kLittleEndian;
         const auto aSecond =
             static_cast<std::uint64_t>(track.RateAsNumber()) * bytes * track.channels;
+        const Json bufferBytes = aSecond == 0 ? Json() : Json(aSecond);  // no rate, no second
         json["formats"].push_back({{"index", i},
                                    {"name", isLittle ? "A2CL" : "A2CB"},
                                    {"words", fmt::format("{}-bit PCM in {} bytes, {}-endian, "
                                                          "interleaved",
                                                          bits, bytes, isLittle ? "little" : "big")},
-                                   {"bufferBytes", aSecond}});
+                                   {"bufferBytes", bufferBytes}});
     }
     if (result < 0) {
         essence.Fail(fmt::format("track {}: no sound formats", track.number), result);
@@ -107,17 +109,24 @@ Json FormatsOf(Essence& essence) {
     return list;
 }
 
-void PrintTrack(const Json& track) {
-    const bool isSound = track["kind"] == "sound";
-    fmt::print("track {}: {}, {} {} at {} a second", track["track"].get<int>(),
-               track["kind"].get<std::string>(), track["length"].get<std::uint64_t>(),
-               isSound ? "samples" : "frames", track["rate"].get<std::string>());
+std::string BufferWords(const Json& format, bool isSound) {
+    const Json& bytes = format["bufferBytes"];
+    if (!bytes.is_number()) {
+        return "bytes a second not known";
+    }
+    return Counted(bytes.get<std::uint64_t>(), "byte") + (isSound ? " a second" : " a frame");
+}
+
+void PrintTrack(const ClipTrack& facts, const Json& track) {
+    const bool isSound = facts.kind == TrackKind::Sound;
+    fmt::print("track {}: {}, {}, {}", facts.number, NameOf(facts.kind),
+               Counted(facts.length, isSound ? "sample" : "frame"), RateWords(facts));
     if (track.contains("width")) {
         fmt::print(", {} {} x {}", track["heightIsOf"].get<std::string>(),
                    track["width"].get<int>(), track["height"].get<int>());
     }
     if (track.contains("channels")) {
-        fmt::print(", {} channels", track["channels"].get<int>());
+        fmt::print(", {}", Counted(facts.channels, "channel"));
     }
     fmt::print("\n");
     if (track.contains("reason")) {
@@ -127,9 +136,9 @@ void PrintTrack(const Json& track) {
         return;
     }
     for (const Json& one : track["formats"]) {
-        fmt::print("  {} {:<10} {}\n               {} bytes a {}\n", one["index"].get<int>(),
+        fmt::print("  {} {:<10} {}\n               {}\n", one["index"].get<int>(),
                    one["name"].get<std::string>(), one["words"].get<std::string>(),
-                   one["bufferBytes"].get<std::uint64_t>(), isSound ? "second" : "frame");
+                   BufferWords(one, isSound));
     }
     if (track["formats"].empty()) {
         fmt::print("  no format is offered\n");
@@ -143,8 +152,8 @@ void Show(Essence& essence, bool json) {
         return;
     }
     fmt::print("{}\n", host::DisplayPath(essence.movie()));
-    for (const Json& track : list) {
-        PrintTrack(track);
+    for (std::size_t i = 0; i < list.size(); ++i) {
+        PrintTrack(essence.tracks()[i], list[i]);
     }
 }
 

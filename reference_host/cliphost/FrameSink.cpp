@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/PixelsToPicture.h"
 #include "reference_host/cliphost/PngFile.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -48,7 +49,7 @@ public:
     std::string Summary() const override {
         return OutputFile::IsStandardOutput(file_)
                    ? std::string()
-                   : fmt::format("{}: {} raw frames", DisplayPath(file_), frames_);
+                   : fmt::format("{}: {}", DisplayPath(file_), Counted(frames_, "raw frame"));
     }
     bool IsRaw() const override { return true; }
 
@@ -97,7 +98,7 @@ public:
     }
     void Finish() override {}
     std::string Summary() const override {
-        return fmt::format("{}: {} pictures", DisplayPath(folder_), frames_);
+        return fmt::format("{}: {}", DisplayPath(folder_), Counted(frames_, "picture"));
     }
     bool IsRaw() const override { return false; }
 
@@ -119,7 +120,8 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
     if (std::filesystem::is_directory(output, ignored)) {
         return std::make_unique<FolderSink>(output, movie.stem(), turn);
     }
-    if (OutputFile::IsStandardOutput(output) || ending == ".raw") {
+    if (OutputFile::DescriptorOf(output) || ending == ".raw" ||
+        (OutputFile::IsDevice(output) && ending != ".png")) {
         return std::make_unique<RawSink>(output);
     }
     if (ending == ".png") {
@@ -137,10 +139,9 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
 }
 
 std::string RawWords(const FrameReader& reader, const ClipTrack& track) {
-    const std::string rate = RateText(track);
-    std::string words =
-        fmt::format("raw frames: {} x {}, {}, {} bytes a frame, {} frames a second", reader.width(),
-                    reader.height(), WordsFor(reader.format()), reader.frameBytes(), rate);
+    std::string words = fmt::format("raw frames: {} x {}, {}, {} a frame, {}", reader.width(),
+                                    reader.height(), WordsFor(reader.format()),
+                                    Counted(reader.frameBytes(), "byte"), RateWords(track));
     const char* const name = reader.layout().rawName;
     if (!name) {
         return words +
@@ -149,7 +150,7 @@ std::string RawWords(const FrameReader& reader, const ClipTrack& track) {
     }
     words += fmt::format("\nfor FFmpeg: -f rawvideo -pixel_format {} -video_size {}x{}", name,
                          reader.width(), reader.height());
-    return track.RateAsNumber() > 0.0 ? words + " -framerate " + rate : words;
+    return track.RateAsNumber() > 0.0 ? words + " -framerate " + RateText(track) : words;
 }
 
 }  // namespace cliphost

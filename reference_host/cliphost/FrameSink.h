@@ -24,8 +24,8 @@ public:
     virtual bool IsRaw() const = 0;
 };
 
-// The sink that a path asks for: "-" and FILE.raw take the bytes as they are
-// delivered, one frame behind the other; FILE.png takes one frame; a folder
+// The sink that a path asks for: "-", devices and FILE.raw take the bytes as they
+// are delivered, one frame behind the other; FILE.png takes one frame; a folder
 // takes a PNG for each, named after the movie and the frame, and is made when
 // it is not there. PNG pictures are turned. Throws a Failure for the caller.
 std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,

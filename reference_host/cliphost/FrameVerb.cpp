@@ -12,6 +12,7 @@
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/TurnOption.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -60,12 +61,17 @@ FrameRange FrameRun::WantedFrames() {
     FrameRange range =
         options_.range.empty() ? OneFrame(options_.frame) : ParseFrameRange(options_.range);
     // One frame need not be counted: it is there or it is not.
-    const bool isCertain = options_.range.empty() && range.first < reader_.MostFrames();
-    const std::uint64_t count = isCertain ? range.first + 1 : reader_.Count();
+    const bool isThere = options_.range.empty() && range.first < reader_.MostFrames() &&
+                         reader_.Read(range.first) != NMA_E_NODATA;
+    const std::uint64_t count = isThere ? range.first + 1 : reader_.Count();
+    if (count == 0) {
+        throw Failure(kExitFile, essence_.movie(),
+                      fmt::format("track {}: it has no frames", track_.number));
+    }
     if (range.CountIn(count) == 0) {
         throw Failure(kExitCaller, essence_.movie(),
                       fmt::format("track {}: there is no frame {}", track_.number, range.first),
-                      fmt::format("it has {}, from 0 on", count));
+                      NumberedFromZero(count, "frame"));
     }
     range.end = std::min(range.end.value_or(count), count);
     return range;

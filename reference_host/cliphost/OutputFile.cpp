@@ -3,29 +3,67 @@
 #include "reference_host/cliphost/OutputFile.h"
 
 #include <fcntl.h>
-#include <fmt/format.h>
 #include <unistd.h>
 
 #include <cerrno>
+#include <charconv>
 #include <csignal>
+#include <string_view>
 #include <system_error>
 #include <utility>
 
 #include "reference_host/cliphost/Failure.h"
-#include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
+std::optional<int> OutputFile::DescriptorOf(const std::filesystem::path& path) {
+    struct Row {
+        std::string_view name;
+        int descriptor;
+    };
+    static constexpr Row kNames[] = {
+        {"-", STDOUT_FILENO}, {"/dev/stdout", STDOUT_FILENO}, {"/dev/stderr", STDERR_FILENO}};
+    const std::string_view name = path.native();
+    for (const Row& row : kNames) {
+        if (name == row.name) {
+            return row.descriptor;
+        }
+    }
+    for (const std::string_view folder : {"/dev/fd/", "/proc/self/fd/"}) {
+        int number = 0;
+        const char* const end = name.data() + name.size();
+        if (name.substr(0, folder.size()) == folder) {
+            const auto read = std::from_chars(name.data() + folder.size(), end, number);
+            return read.ec == std::errc() && read.ptr == end && number >= 0 ? std::optional(number)
+                                                                            : std::nullopt;
+        }
+    }
+    return std::nullopt;
+}
+
+bool OutputFile::IsDevice(const std::filesystem::path& path) {
+    std::error_code ignored;
+    const auto there = std::filesystem::status(path, ignored);
+    return DescriptorOf(path) ||
+           (std::filesystem::exists(there) && !std::filesystem::is_regular_file(there) &&
+            !std::filesystem::is_directory(there));
+}
 
 OutputFile::OutputFile(std::filesystem::path path) : path_(std::move(path)) {
     // A reader that goes away shows itself as a failed write, not as the end of
     // this program.
     std::signal(SIGPIPE, SIG_IGN);
-    if (IsStandardOutput(path_)) {
-        descriptor_ = STDOUT_FILENO;
+    if (const std::optional<int> open = DescriptorOf(path_)) {
+        descriptor_ = fcntl(*open, F_DUPFD_CLOEXEC, STDERR_FILENO + 1);
+        if (descriptor_ < 0) {
+            Fail(errno);
+        }
         return;
     }
-    std::error_code ignored;
-    const auto status = std::filesystem::status(path_, ignored);
+    std::error_code error;
+    const auto status = std::filesystem::status(path_, error);
+    if (status.type() == std::filesystem::file_type::none) {
+        Fail(error.value());  // such as links in a circle
+    }
     if (std::filesystem::is_directory(status)) {
         Fail(EISDIR);
     }
@@ -42,7 +80,9 @@ OutputFile::OutputFile(std::filesystem::path path) : path_(std::move(path)) {
 }
 
 OutputFile::~OutputFile() {
-    Close();
+    if (descriptor_ >= 0) {
+        close(descriptor_);
+    }
 }
 
 void OutputFile::Write(const void* bytes, std::size_t size) {
@@ -65,7 +105,7 @@ void OutputFile::Write(const void* bytes, std::size_t size) {
 
 void OutputFile::Finish() {
     // Some systems tell of a full disk only here.
-    if (descriptor_ > STDERR_FILENO && close(std::exchange(descriptor_, -1)) != 0) {
+    if (close(std::exchange(descriptor_, -1)) != 0) {
         Fail(errno);
     }
     if (unfinished_) {
@@ -78,15 +118,9 @@ void OutputFile::Finish() {
 }
 
 void OutputFile::Fail(int error) {
-    throw Failure(kExitCaller, IsStandardOutput(path_) ? "standard output" : path_,
+    const bool isOwn = IsStandardOutput(path_);
+    throw Failure(kExitCaller, isOwn ? std::filesystem::path("standard output") : path_,
                   "not written: " + std::generic_category().message(error));
-}
-
-void OutputFile::Close() {
-    if (descriptor_ > STDERR_FILENO) {
-        close(descriptor_);
-    }
-    descriptor_ = -1;
 }
 
 }  // namespace cliphost

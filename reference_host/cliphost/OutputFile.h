@@ -19,8 +19,8 @@ public:
 
 // A file that is there whole or not at all: it is written beside its place under
 // another name, and takes its place when it is finished. An object that ends
-// unfinished leaves nothing. A path of "-" is standard output, and devices and
-// pipes are written as they are.
+// unfinished leaves nothing. What has no place of that kind is written as it
+// is: "-", which is standard output, and devices and pipes.
 class OutputFile {
 public:
     explicit OutputFile(std::filesystem::path path);  // throws a Failure
@@ -32,11 +32,16 @@ public:
     void Write(const void* bytes, std::size_t size);
     void Finish();  // throws a Failure
 
-    static bool IsStandardOutput(const std::filesystem::path& path) { return path == "-"; }
+    // The open descriptor that a path stands for: "-", "/dev/stdout", "/dev/fd/5".
+    static std::optional<int> DescriptorOf(const std::filesystem::path& path);
+    static bool IsStandardOutput(const std::filesystem::path& path) {
+        return DescriptorOf(path) == 1;
+    }
+    // Whether a path is such a descriptor, or a device or pipe that is there.
+    static bool IsDevice(const std::filesystem::path& path);
 
 private:
     [[noreturn]] void Fail(int error);
-    void Close();
 
     std::filesystem::path path_;
     std::optional<UnfinishedFile> unfinished_;  // none: the place itself is written

@@ -4,8 +4,10 @@
 #include <fmt/format.h>
 
 #include <map>
+#include <set>
 
 #include "reference_host/cliphost/Describe.h"
+#include "reference_host/cliphost/FileFields.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
@@ -32,37 +34,28 @@ const std::map<std::string, ParameterXml> kXml = {{"values", ParameterXml::kValu
 // The name of a set may come from any document.
 constexpr std::size_t kLongestName = 200;
 
-// All choices of a parameter, a star at the one in use. A number that is none of
-// them is the file's own way.
-void PrintParameter(const ClipParameter& parameter) {
-    const auto line = [&](const std::string& text, std::optional<ncfUInt32> value) {
-        fmt::print("    {} {}{}\n", parameter.value == value ? '*' : ' ', text,
-                   parameter.defaultValue == value ? " (default)" : "");
+// All choices of a parameter, a star at the one in use. What is none of them
+// stands behind them.
+void PrintParameter(const ClipParameter& parameter, const FileFields& file) {
+    const auto line = [&](const std::string& text, bool isUsed, bool isDefault) {
+        fmt::print("    {} {}{}\n", isUsed ? '*' : ' ', text, isDefault ? " (default)" : "");
     };
-    const auto isChoice = [&](std::optional<ncfUInt32> value) {
-        for (const host::ParameterChoice& choice : parameter.info.choices) {
-            if (value == choice.value) {
-                return true;
-            }
-        }
-        return false;
-    };
+    const std::string used = WordsForValue(parameter.info, parameter.value, file);
+    const std::string usual = WordsForValue(parameter.info, parameter.defaultValue, file);
+    std::set<std::string> shown;
     fmt::print("  {} (\"{}\")\n", parameter.info.label, parameter.info.name);
     for (const host::ParameterChoice& choice : parameter.info.choices) {
-        line(choice.text, choice.value);
+        line(choice.text, choice.text == used, choice.text == usual);
+        shown.insert(choice.text);
     }
-    const auto other = [&](std::optional<ncfUInt32> value) {
-        if (!isChoice(value)) {
-            line(value ? fmt::format("none of these: {}", *value) : "no value", value);
+    for (const std::string& other : {used, usual}) {
+        if (shown.insert(other).second) {
+            line(other, other == used, other == usual);
         }
-    };
-    other(parameter.value);
-    if (parameter.defaultValue != parameter.value) {
-        other(parameter.defaultValue);
     }
 }
 
-nlohmann::ordered_json ToJson(const ClipParameter& parameter) {
+nlohmann::ordered_json ToJson(const ClipParameter& parameter, const FileFields& file) {
     const auto number = [](std::optional<ncfUInt32> value) {
         return value ? nlohmann::ordered_json(*value) : nlohmann::ordered_json();
     };
@@ -74,10 +67,12 @@ nlohmann::ordered_json ToJson(const ClipParameter& parameter) {
             {"label", parameter.info.label},
             {"value", number(parameter.value)},
             {"default", number(parameter.defaultValue)},
+            {"words", WordsForValue(parameter.info, parameter.value, file)},
+            {"defaultWords", WordsForValue(parameter.info, parameter.defaultValue, file)},
             {"choices", std::move(choices)}};
 }
 
-void Print(ClipParameters& parameters, const ParamsOptions& options) {
+void Print(ClipParameters& parameters, const ParamsOptions& options, const FileFields& file) {
     if (!options.xml.empty()) {
         fmt::print("{}\n", parameters.Xml(kXml.at(options.xml)));
         return;
@@ -87,7 +82,7 @@ void Print(ClipParameters& parameters, const ParamsOptions& options) {
     if (!options.json) {
         fmt::print("{}: {}\n", DisplayPath(options.movie), host::ShownText(set, kLongestName));
         for (const ClipParameter& parameter : list) {
-            PrintParameter(parameter);
+            PrintParameter(parameter, file);
         }
         return;
     }
@@ -95,7 +90,7 @@ void Print(ClipParameters& parameters, const ParamsOptions& options) {
                                    {"set", set},
                                    {"parameters", nlohmann::ordered_json::array()}};
     for (const ClipParameter& parameter : list) {
-        json["parameters"].push_back(ToJson(parameter));
+        json["parameters"].push_back(ToJson(parameter, file));
     }
     PrintJson(json);
 }
@@ -119,11 +114,19 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
             host::Ref<NMA::IMediaContainer3> container;
             const NCFRESULT opened = OpenContainer(running, options->movie, container);
             if (opened < 0) {
-                throw Failure(kExitFile, ProblemWith(running, options->movie, opened));
+                throw Failure(ProblemWith(running, options->movie, opened));
+            }
+            // A container takes parameters also for what is no movie.
+            const Description description =
+                DescribeContainer(running, container.get(), options->movie);
+            // Before the user's values count.
+            const FileFields file = ReadFileFields(*container);
+            if (description.problem && file.order.empty()) {
+                throw Failure(description.problem);
             }
             ClipParameters parameters(running, options->movie, *container);
             options->parameters.ApplyTo(parameters);
-            Print(parameters, *options);
+            Print(parameters, *options, file);
         });
     });
 }

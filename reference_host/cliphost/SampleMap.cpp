@@ -145,10 +145,11 @@ RunMap ReadRuns(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t fileSiz
                              next, run.bytes, sum));
         }
         if (run.position > fileSize || run.bytes > fileSize - run.position) {
-            Tell(found,
-                 fmt::format("samples {} to {} lie at bytes {} to {}, and the file ends at {}",
-                             next, next + run.count - 1, run.position, run.position + run.bytes,
-                             fileSize));
+            Tell(found, fmt::format("{} at bytes {} to {}, and the file ends at {}",
+                                    run.count == 1 ? fmt::format("sample {} lies", next)
+                                                   : fmt::format("samples {} to {} lie", next,
+                                                                 next + run.count - 1),
+                                    run.position, run.position + run.bytes, fileSize));
         }
         found.bytes += sum;
         next += run.count;

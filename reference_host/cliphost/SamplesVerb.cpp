@@ -9,6 +9,7 @@
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/SampleMap.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -117,7 +118,11 @@ void SamplesRun::ShowSums(const RunMap& runs, Json& json) {
         json["faults"] = runs.faults;
         return;
     }
-    fmt::print("  {} bytes in {} runs; the file has {}\n", runs.bytes, runs.runs.size(), fileSize_);
+    if (runs.samples == 0) {
+        return;
+    }
+    fmt::print("  {} in {}; the file has {}\n", Counted(runs.bytes, "byte"),
+               Counted(runs.runs.size(), "run"), Counted(fileSize_, "byte"));
     for (const std::string& fault : runs.faults) {
         fmt::print("  wrong: {}\n", fault);
     }
@@ -140,10 +145,13 @@ void SamplesRun::ShowTrack(const ClipTrack& track) {
         json["channels"] = channels;
     }
     if (!options_.json) {
-        fmt::print("track {}: {}, {} samples{}\n", track.number, NameOf(track.kind), runs.samples,
-                   hasChannels ? fmt::format(" of {} channels", channels) : "");
+        fmt::print("track {}: {}, {}{}\n", track.number, NameOf(track.kind),
+                   Counted(runs.samples, "sample"),
+                   hasChannels ? " of " + Counted(channels, "channel") : "");
     }
-    if (track.kind == TrackKind::Sound && !options_.every) {
+    if (runs.samples == 0) {
+        json[track.kind == TrackKind::Sound && !options_.every ? "runs" : "map"] = Json::array();
+    } else if (track.kind == TrackKind::Sound && !options_.every) {
         ShowRuns(runs, json);
     } else {
         ShowSamples(track, runs.samples, json);
@@ -164,7 +172,7 @@ int SamplesRun::Run() {
     if (tracks_.empty()) {
         throw Failure(kExitCaller, options_.movie,
                       fmt::format("there is no track {}", options_.track.value_or(0)),
-                      fmt::format("it has {}", essence_.tracks().size()));
+                      essence_.TrackList());
     }
     if (options_.json) {
         PrintJson({{"movie", MachinePath(options_.movie)},

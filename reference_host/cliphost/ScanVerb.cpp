@@ -11,8 +11,10 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/HostText.h"
+#include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
 namespace {
@@ -31,6 +33,7 @@ struct FolderFacts {
     std::string name;
     ncfUInt32 newest = 0;
     std::vector<std::filesystem::path> movies;
+    OtherMovies others;
 };
 
 FolderFacts Scan(Session& session, const std::filesystem::path& folder) {
@@ -45,22 +48,60 @@ FolderFacts Scan(Session& session, const std::filesystem::path& folder) {
         facts.name = host::text::ReadUtf8(name.get());
     }
     info->GetModificationDate(&facts.newest);
-    const FolderClips clips(session, path.get());
+    const FolderClips clips(session, folder);
     for (const FolderClip& clip : clips.clips()) {
         facts.movies.push_back(clip.path);
     }
+    facts.others = clips.others();
     return facts;
 }
 
 nlohmann::ordered_json ToJson(const FolderFacts& facts) {
-    nlohmann::ordered_json movies = nlohmann::ordered_json::array();
-    for (const std::filesystem::path& movie : facts.movies) {
-        movies.push_back(MachinePath(movie));
-    }
+    const auto list = [](const std::vector<std::filesystem::path>& movies) {
+        nlohmann::ordered_json paths = nlohmann::ordered_json::array();
+        for (const std::filesystem::path& movie : movies) {
+            paths.push_back(MachinePath(movie));
+        }
+        return paths;
+    };
     return {{"claimed", facts.claimed},
             {"name", facts.name},
             {"newest", facts.newest},
-            {"movies", std::move(movies)}};
+            {"movies", list(facts.movies)},
+            {"otherEnding", list(facts.others.otherEnding)},
+            {"withBackslash", list(facts.others.withBackslash)}};
+}
+
+void Print(const FolderFacts& facts) {
+    fmt::print("claimed: {}, newest movie from {}\n", host::text::Printable(facts.name),
+               DateText(facts.newest));
+    for (const std::filesystem::path& movie : facts.movies) {
+        fmt::print("  {}\n", host::DisplayPath(movie));
+    }
+    fmt::print("{}\n", Counted(facts.movies.size(), "movie"));
+}
+
+// Whether the module claims a folder, and what it lists; a movie that can't be
+// named to it is refused as one on the command line is.
+int ShowFolder(Session& session, const std::filesystem::path& folder, bool json) {
+    const FolderFacts facts = Scan(session, folder);
+    const Problem problem = facts.claimed ? LeftOut(folder, facts.others) : NotClaimed(folder);
+    if (json) {
+        nlohmann::ordered_json answer = ToJson(facts);
+        AddProblem(problem, answer);
+        PrintJson(answer);
+    } else if (facts.claimed) {
+        Print(facts);
+    }
+    if (problem) {
+        TellProblem(problem, session.verbosity());
+    }
+    for (const std::filesystem::path& movie : facts.others.withBackslash) {
+        TellProblem(BackslashProblem(movie), session.verbosity());
+    }
+    return !facts.claimed                       ? kExitFile
+           : facts.others.withBackslash.empty() ? kExitFine
+                                                : kExitCaller;
 }
 
 }  // namespace
@@ -74,27 +115,16 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
     verb->add_option("folder", *folder, "The folder")->required();
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, &status, folder, json] {
-        if (!std::filesystem::is_directory(*folder)) {
-            throw Failure(kExitCaller, *folder, "is no folder",
-                          "`cliphost describe` takes single movies");
-        }
-        Session session(options);
-        const FolderFacts facts = Scan(session, *folder);
-        status = facts.claimed ? kExitFine : kExitFile;
-        if (*json) {
-            PrintJson(ToJson(facts));
-            return;
-        }
-        if (!facts.claimed) {
-            fmt::print("{}: not claimed: no file there is named *.mov\n",
-                       host::DisplayPath(*folder));
-            return;
-        }
-        fmt::print("claimed: {}, newest movie of {}\n", facts.name, DateText(facts.newest));
-        for (const std::filesystem::path& movie : facts.movies) {
-            fmt::print("  {}\n", host::DisplayPath(movie));
-        }
-        fmt::print("{} movies\n", facts.movies.size());
+        AnswerFailureToo(*json, {{"folder", MachinePath(*folder)}}, [&] {
+            PathForModule(*folder);  // that it is there, and can be named
+            std::error_code ignored;
+            if (!std::filesystem::is_directory(*folder, ignored)) {
+                throw Failure(kExitCaller, *folder, "is no folder",
+                              "`cliphost describe` takes single movies");
+            }
+            Session session(options);
+            status = ShowFolder(session, *folder, *json);
+        });
     });
 }
 

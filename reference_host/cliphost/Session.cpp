@@ -90,11 +90,16 @@ Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) 
     host_->RegisterComponent(NCFCompID_QTParser, header_parser::QTParserMaker());
     host::RegisterQuickTimeComponents(*host_);
 
+    const std::filesystem::path module =
+        options.plugin.empty() ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"
+                               : options.plugin;
+    std::error_code ignored;
+    // The module looks for its data files by the path that it was loaded from.
+    if (host::text::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
+        throw Failure(kExitCaller, BackslashProblem(module));
+    }
     host::LoadFailure failure;
-    plugin_ = host_->LoadModule(options.plugin.empty()
-                                    ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"
-                                    : options.plugin,
-                                failure);
+    plugin_ = host_->LoadModule(module, failure);
     if (!plugin_) {
         throw Failure(kExitCaller, failure.message);
     }
@@ -119,6 +124,13 @@ std::vector<std::filesystem::path> Session::MissingDataFiles() const {
     return missing;
 }
 
+Problem BackslashProblem(const std::filesystem::path& path) {
+    return {path,
+            "a name with a backslash in it can't be passed to the module, which separates folders "
+            "by it",
+            "rename it"};
+}
+
 host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
     std::error_code error;
     const std::filesystem::path absolute =
@@ -127,10 +139,7 @@ host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
         throw Failure(kExitCaller, path, "there is no such file or folder");
     }
     if (host::text::HoldsBackslash(absolute)) {
-        throw Failure(kExitCaller, path,
-                      "a name with a backslash in it can't be passed to the module, which "
-                      "separates folders by it",
-                      "rename it");
+        throw Failure(kExitCaller, BackslashProblem(path));
     }
     return host::ModulePath(absolute);
 }

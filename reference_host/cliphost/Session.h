@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "reference_host/cliphost/AafLibrary.h"
+#include "reference_host/cliphost/Problem.h"
 #include "reference_host/framework/Host.h"
 #include "reference_host/framework/String.h"
 
@@ -47,6 +48,9 @@ private:
     std::unique_ptr<host::Host> host_;
     host::PluginModule* plugin_ = nullptr;
 };
+
+// That a path holds a backslash of its own, which no system but Windows refuses.
+Problem BackslashProblem(const std::filesystem::path& path);
 
 // A path as the module wants it: absolute, with backslashes. Throws a Failure
 // for one that does not exist or that holds a backslash of its own.

@@ -54,9 +54,23 @@ int TakeSlot(const std::string& name) {
     return -1;
 }
 
+// A chain of links that is longer goes in a circle.
+constexpr int kMostLinks = 40;
+
+// Where a file is to lie: behind links, which stay.
+std::filesystem::path BehindLinks(std::filesystem::path path) {
+    std::error_code error;
+    for (int i = 0; i < kMostLinks && std::filesystem::is_symlink(path, error); ++i) {
+        const std::filesystem::path target = std::filesystem::read_symlink(path, error);
+        path = target.is_absolute() ? target : path.parent_path() / target;
+    }
+    return path;
+}
+
 }  // namespace
 
-UnfinishedFile::UnfinishedFile(const std::filesystem::path& place) : place_(place), path_(place) {
+UnfinishedFile::UnfinishedFile(const std::filesystem::path& place)
+    : place_(BehindLinks(place)), path_(place_) {
     path_ += fmt::format(".{}.part", getpid());
     // Absolute, should the working folder change.
     std::error_code error;

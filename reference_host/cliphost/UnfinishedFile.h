@@ -7,7 +7,8 @@
 
 namespace cliphost {
 
-// The name beside a file's place under which it is written until it is whole.
+// The name beside a file's place under which it is written until it is whole. A
+// link stays; what it leads to is the place.
 // What has not taken its place is removed: when the object ends, and when the
 // program is ended by a signal, such as an interrupt at the keyboard.
 class UnfinishedFile {

@@ -13,6 +13,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -82,6 +83,11 @@ int Run(int argc, char** argv) {
     app.name("cliphost");
     app.require_subcommand(1);
     app.fallthrough();
+    app.footer(
+        "Exit status: 0, all is done; 1, a file is at fault, by what it holds; 2, the call is, "
+        "such "
+        "as by a\nwrong option, a file that is not there, or an output that can't be written. Of "
+        "several failures\nthe highest is given.");
     app.set_version_flag("--version", "cliphost 1.3.2");
     app.add_flag("-v", session.verbosity,
                  "Console lines of the module on standard error; twice for its log too");
@@ -141,6 +147,8 @@ int Run(int argc, char** argv) {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
         return app.exit(error) == 0 ? kExitFine : kExitCaller;
+    } catch (const ReaderGone&) {
+        return status;  // it has seen enough
     } catch (const Failure& failure) {
         TellProblem(failure.problem(), session.verbosity);
         return failure.status();

@@ -29,6 +29,11 @@ CommandResult RunCliphost(const std::string& arguments) {
     return RunCommand(Quoted(ProgramFolder() / "cliphost") + " " + arguments + " 2>&1");
 }
 
+void ExpectSays(const CommandResult& result, int status, const std::string& words) {
+    EXPECT_EQ(result.status, status) << result.out;
+    EXPECT_NE(result.out.find(words), std::string::npos) << words << "\nis not in:\n" << result.out;
+}
+
 std::string Quoted(const std::filesystem::path& path) {
     std::string quoted = "'";
     for (const char c : path.string()) {

@@ -13,5 +13,7 @@ struct CommandResult {
 CommandResult RunCommand(const std::string& command);
 // The program under test, with arguments; standard error is in `out` too.
 CommandResult RunCliphost(const std::string& arguments);
+// The same of its end: the exit status, and words among what it printed.
+void ExpectSays(const CommandResult& result, int status, const std::string& words);
 // A path as one word of the shell.
 std::string Quoted(const std::filesystem::path& path);

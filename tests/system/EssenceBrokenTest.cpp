@@ -194,11 +194,34 @@ TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
     EXPECT_EQ(result.status, 2) << result.out;
     EXPECT_NE(result.out.find("give --rate"), std::string::npos) << result.out;
     EXPECT_FALSE(std::filesystem::exists(wav));
-    const CommandResult told =
-        RunCliphost("audio " + cut.string() + " --start 8000 --rate 48000 -o " + wav.string());
-    EXPECT_EQ(told.status, 1);
-    EXPECT_NE(told.out.find("could not be read and are silence"), std::string::npos) << told.out;
-    EXPECT_EQ(Decoded(wav, "-f s24le -c:a pcm_s24le").size(), 11200u * 6);
+    // Longer than what is read at a time.
+    const auto whole = folder() / "long.mov";
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=r=48000:d=4 -c:a pcm_s16le "
+                         "-movflags +faststart " +
+                         whole.string())
+                  .status,
+              0);
+    ExpectSays(
+        RunCliphost("audio " + Cut(whole, 0.4).string() + " --rate 48000 -o " + wav.string()), 1,
+        "which could not be read");
+    EXPECT_EQ(Decoded(wav, "-f s24le -c:a pcm_s24le").size(), 192000u * 3);
+}
+
+TEST_F(EssenceBroken, SoundOfWhichNothingCanBeReadLeavesNoFile) {
+    const auto cut = Cut(HeaderFirst("pcm_s16le.mov"), 0.2);
+    for (const char* const output : {"a.wav", "b.wav"}) {
+        std::ofstream(folder() / "b.wav") << "before";
+        ExpectSays(RunCliphost("audio " + cut.string() + " --start 8000 --rate 48000 -o " +
+                               (folder() / output).string()),
+                   1, "track 0: none of its samples from 8000 to 19199 could be read");
+    }
+    EXPECT_FALSE(std::filesystem::exists(folder() / "a.wav"));
+    EXPECT_EQ(std::filesystem::file_size(folder() / "b.wav"), 6u) << "what was there stays";
+    const CommandResult streamed =
+        RunCommand(Quoted(ProgramFolder() / "cliphost") + " audio " + cut.string() +
+                   " --start 8000 --rate 48000 -o - 2>/dev/null");
+    EXPECT_EQ(streamed.status, 1);
+    EXPECT_EQ(streamed.out, "");
 }
 
 }  // namespace

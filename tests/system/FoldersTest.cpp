@@ -67,8 +67,7 @@ TEST_F(Folders, WithAMovieOfAnyNameAreListed) {
     for (const std::string& name : names) {
         expected.insert(Copy("png.mov", name));
     }
-    const auto path = cliphost::PathForModule(folder());
-    const cliphost::FolderClips clips(session(), path.get());
+    const cliphost::FolderClips clips(session(), folder());
     std::set<std::filesystem::path> listed;
     for (const cliphost::FolderClip& clip : clips.clips()) {
         listed.insert(clip.path);
@@ -83,8 +82,7 @@ TEST_F(Folders, WithOneBadMovieStillGiveTheOthers) {
     Copy("png.mov", "good.mov");
     Write(movies::Bytes(100, 'x'), "bad.mov");
     Copy("mjpeg.mov", "other.mov");
-    const auto path = cliphost::PathForModule(folder());
-    const cliphost::FolderClips clips(session(), path.get());
+    const cliphost::FolderClips clips(session(), folder());
     ASSERT_EQ(clips.clips().size(), 3u);
     std::map<std::string, bool> described;
     for (const cliphost::FolderClip& clip : clips.clips()) {
@@ -116,8 +114,7 @@ TEST_F(Folders, TellTheirNewestDate) {
 // A list describes a movie as a container does.
 TEST_F(Folders, DescribeAsContainersDo) {
     const auto movie = Copy("prores_with_pcm.mov", "movie.mov");
-    const auto path = cliphost::PathForModule(folder());
-    const cliphost::FolderClips clips(session(), path.get());
+    const cliphost::FolderClips clips(session(), folder());
     ASSERT_EQ(clips.clips().size(), 1u);
     const auto fromList = cliphost::DescribeFromList(session(), clips.list(), 0, movie);
     ASSERT_TRUE(fromList.file) << LineOf(fromList.problem);

@@ -39,15 +39,54 @@ TEST_F(ParamsVerb, PrintsChoicesWithAStarAtTheOneInUse) {
                            "      Progressive\n"
                            "      Interlaced - Odd (upper field first) ordered (default)\n"
                            "      Interlaced - Even (lower field first) ordered\n"
-                           "    * none of these: 8192\n"
+                           "    * as the file says: top field first\n"
                            "  Field Layout (\"Field Layout\")\n"
                            "      Merged\n"
                            "      Split\n"
-                           "    * none of these: 1 (default)\n"
+                           "    * as the file says: merged (default)\n"
                            "  GFX-Video Level (\"Level Remapping\")\n"
                            "      Do not modify levels (default)\n"
                            "    * Expand video levels to graphic levels\n"
                            "      Compress graphic levels to video levels\n");
+}
+
+// The words of a parameter's present value, which has the star.
+std::string Used(const std::string& out, const std::string& parameter) {
+    const std::size_t from = out.find("(\"" + parameter + "\")");
+    const std::size_t star = out.find("    * ", from);
+    return star == std::string::npos ? "" : out.substr(star + 6, out.find('\n', star) - star - 6);
+}
+
+TEST_F(ParamsVerb, SaysWhatTheFileSaysWhereTheUserChoseNothing) {
+    struct Case {
+        const char* movie;
+        const char* order;
+    };
+    for (const Case& each : {Case{kInterlaced, "as the file says: top field first"},
+                             Case{"prores_hq_480i.mov", "as the file says: bottom field first"},
+                             Case{"h264_bframes.mov", "as the file says: progressive"},
+                             Case{"pcm_u8.mov", "as the file says (default)"}}) {
+        SCOPED_TRACE(each.movie);
+        const CommandResult ran = Params("'" + MadeMovie(each.movie).string() + "'");
+        EXPECT_EQ(ran.status, 0);
+        EXPECT_EQ(Used(ran.out, "Field Ordering In File"), each.order) << ran.out;
+        EXPECT_EQ(ran.out.find("none of these"), std::string::npos) << ran.out;
+    }
+}
+
+TEST_F(ParamsVerb, SaysWhatTheFileSaysBesideWhatTheUserChose) {
+    const CommandResult chosen =
+        Params(movie + " --set 'Field Layout=Split' --set 'Field Ordering=Progressive'");
+    EXPECT_EQ(Used(chosen.out, "Field Ordering In File"), "Progressive");
+    EXPECT_EQ(Used(chosen.out, "Field Layout"), "Split");
+    EXPECT_NE(chosen.out.find("      as the file says: merged (default)\n"), std::string::npos)
+        << chosen.out;
+    // A number that is no choice leaves the file's order in force, but not the
+    // levels as they are.
+    const CommandResult odd =
+        Params(movie + " --set 'Field Ordering=99' --set 'Level Remapping=7'");
+    EXPECT_EQ(Used(odd.out, "Field Ordering In File"), "99, so as the file says: top field first");
+    EXPECT_EQ(Used(odd.out, "Level Remapping"), "none of these: 7");
 }
 
 TEST_F(ParamsVerb, PrintsTheNameOfASetOnOneLineWithoutCommandsToTheTerminal) {

@@ -4,10 +4,9 @@
 // The program as scripts and careless hands call it: what it refuses, what it
 // keeps safe, and what it goes on with.
 
-#include <sys/stat.h>
-
 #include <nlohmann/json.hpp>
 
+#include "reference_host/util/text/FileUrl.h"
 #include "tests/system/EssenceSupport.h"
 #include "tests/system/SystemTest.h"
 
@@ -32,11 +31,6 @@ std::string Program() {
     return (ProgramFolder() / "cliphost").string();
 }
 
-void ExpectSays(const CommandResult& result, int status, const std::string& words) {
-    EXPECT_EQ(result.status, status) << result.out;
-    EXPECT_NE(result.out.find(words), std::string::npos) << result.out;
-}
-
 TEST_F(ProgramCalls, NeverWriteOverTheMovie) {
     const auto movie = Copy("prores_with_pcm.mov", "a.mov");
     const auto before = ReadFile(movie);
@@ -55,12 +49,12 @@ TEST_F(ProgramCalls, NeverWriteOverTheMovie) {
 TEST_F(ProgramCalls, GoOnWithTheOtherMoviesAfterOneThatIsBad) {
     const auto movie = Copy("png.mov", "a.mov");
     const auto calls = "describe -q " + Out("missing.mov") + " " + movie;
-    ExpectSays(RunCliphost(calls), 1, "missing.mov: there is no such file");
-    ExpectSays(RunCliphost(calls), 1, "1 described, 1 not");
+    ExpectSays(RunCliphost(calls), 2, "missing.mov: there is no such file");
+    ExpectSays(RunCliphost(calls), 2, "1 described, 1 not");
     ExpectSays(RunCliphost("describe -q " + Out("missing.mov")), 2, "there is no such file");
     const CommandResult json = RunCommand(Program() + " describe --json " + Out("missing.mov") +
                                           " " + movie + " 2>/dev/null");
-    EXPECT_EQ(json.status, 1);
+    EXPECT_EQ(json.status, 2);
     const Json list = Json::parse(json.out);
     ASSERT_EQ(list.size(), 2u);
     EXPECT_EQ(list[0]["reason"], "there is no such file or folder");
@@ -72,7 +66,7 @@ TEST_F(ProgramCalls, GoOnAfterADescriptionThatCantBeSaved) {
     const auto first = Copy("png.mov", "a.mov");
     const auto second = Copy("png.mov", "b.mov");
     std::filesystem::create_directories(folder() / "out" / "a.aaf");
-    ExpectSays(RunCliphost("describe -q --out-dir " + Out("out") + " " + first + " " + second), 1,
+    ExpectSays(RunCliphost("describe -q --out-dir " + Out("out") + " " + first + " " + second), 2,
                "a.aaf: not saved: a folder is there");
     EXPECT_TRUE(std::filesystem::is_regular_file(folder() / "out" / "b.aaf"));
 }
@@ -93,18 +87,13 @@ TEST_F(ProgramCalls, LeaveAForeignFileOfASimilarNameAlone) {
     EXPECT_EQ(FilesLeft(), 3u);
 }
 
-TEST_F(ProgramCalls, SaveDescriptionsAsFilesAlone) {
+TEST_F(ProgramCalls, SaveDescriptionsInFoldersThatAreThere) {
     const auto movie = Copy("png.mov", "a.mov");
-    // As a device does, a pipe stands for something that no file may replace.
-    ASSERT_EQ(mkfifo(Out("pipe").c_str(), 0600), 0);
-    ExpectSays(RunCliphost("describe -q " + movie + " --aaf " + Out("pipe")), 2,
-               "not saved: a device is there");
-    EXPECT_TRUE(std::filesystem::is_fifo(folder() / "pipe"));
     ExpectSays(RunCliphost("describe -q " + movie + " --aaf " + Out("no/a.aaf")), 2,
                "there is no folder");
     ExpectSays(RunCliphost("describe -q " + movie + " --out-dir " + movie), 2,
                "the folder can't be made");
-    EXPECT_EQ(FilesLeft(), 2u);
+    EXPECT_EQ(FilesLeft(), 1u);
 }
 
 TEST_F(ProgramCalls, RefuseValuesThatMeanNothing) {
@@ -160,7 +149,7 @@ TEST_F(ProgramCalls, EndARangeWhoseNextFrameWouldBeBeyondAllNumbers) {
     const auto movie = MadeMovie("h264_with_aac.mov").string();
     ExpectSays(
         RunCliphost("frame " + movie + " --range 1::18446744073709551615 -o " + Out("a.raw")), 0,
-        "a.raw: 1 raw frames");
+        "a.raw: 1 raw frame\n");
 }
 
 TEST_F(ProgramCalls, TellWhenStandardOutputTakesNothing) {
@@ -228,11 +217,9 @@ TEST_F(ProgramCalls, TakeThePathsBackThatTheyGiveInJson) {
         const Json described =
             json("describe --json " + movie + " --out-dir " + Quoted(Out("out")))[0];
         takesBack(described["movie"]);
-        EXPECT_EQ(RunCliphost("describe -q " + Out("in") + " --aaf " +
-                              Quoted(described["aaf"].get<std::string>()))
-                      .status,
-                  2)
-            << "the file is there, so that this names no folder";
+        std::string saved = described["aaf"].get<std::string>();
+        host::text::PathOfFileUrl(saved, saved);
+        EXPECT_TRUE(std::filesystem::is_regular_file(saved)) << saved;
         std::filesystem::remove_all(folder() / "in");
         std::filesystem::remove_all(folder() / "out");
     }
