@@ -27,7 +27,7 @@ public:
 
     NCFRESULT QueryInterface(const GUID& iid, void** out) override {
         if (out == nullptr) {
-            return NCF_E_POINTER;
+            return NCF_E_INVALIDARG;
         }
         *out = nullptr;
         const NCFRESULT allowed = AskQueryRule(iid);

@@ -43,7 +43,7 @@ NCFRESULT ComponentFactory::CreateComponent(const GUID& component, INCFUnknown* 
         return maker(host, outer, iid, out);
     });
     if (result < 0) {
-        *out = nullptr;
+        ReleaseOutput(*out);
     }
     return result;
 }

@@ -165,20 +165,18 @@ void PluginModule::EnterComponents() {
         const NCFRESULT result = functions_.getClassFactory(host_.get(), component.classId,
                                                             IID_INCFClassFactory, &factory);
         component.hasFactory = result >= 0 && factory != nullptr;
-        if (component.hasFactory) {
-            static_cast<INCFClassFactory*>(factory)->Release();
-        }
+        ReleaseOutput(factory);
         factory_->Register(
             component.id,
             [classId = component.classId, getClassFactory = functions_.getClassFactory](
                 INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out) -> NCFRESULT {
                 void* made = nullptr;
                 const NCFRESULT found = getClassFactory(host, classId, IID_INCFClassFactory, &made);
-                if (found < 0 || made == nullptr) {
-                    return found < 0 ? found : NCF_E_UNEXPECTED;
-                }
                 const auto maker =
                     Ref<INCFClassFactory>::Adopt(static_cast<INCFClassFactory*>(made));
+                if (found < 0 || !maker) {
+                    return found < 0 ? found : NCF_E_UNEXPECTED;
+                }
                 return maker->CreateInstance(host, outer, iid, out);
             });
     }

@@ -69,6 +69,14 @@ Ref<T> MakeRef(Arguments&&... arguments) {
     return Ref<T>::Adopt(new T(std::forward<Arguments>(arguments)...));
 }
 
+// Gives back what a failed call left in its output: a component may hand a
+// reference out before it fails, and whoever asked owns it all the same.
+inline void ReleaseOutput(void*& out) {
+    if (void* left = std::exchange(out, nullptr)) {
+        static_cast<INCFUnknown*>(left)->Release();
+    }
+}
+
 // Asks `from`, which is borrowed, for the interface that `out` holds.
 template <class Interface>
 NCFRESULT Query(INCFUnknown* from, Ref<Interface>& out) {
@@ -79,7 +87,10 @@ NCFRESULT Query(INCFUnknown* from, Ref<Interface>& out) {
     void* found = nullptr;
     const NCFRESULT result =
         from->QueryInterface(ncfIdOf(static_cast<const Interface*>(nullptr)), &found);
-    out = Ref<Interface>::Adopt(result < 0 ? nullptr : static_cast<Interface*>(found));
+    if (result < 0) {
+        ReleaseOutput(found);
+    }
+    out = Ref<Interface>::Adopt(static_cast<Interface*>(found));
     return result;
 }
 
@@ -90,7 +101,10 @@ NCFRESULT Create(INCFComponentFactory& factory, const GUID& component, Ref<Inter
     void* made = nullptr;
     const NCFRESULT result = factory.CreateComponent(
         component, nullptr, ncfIdOf(static_cast<const Interface*>(nullptr)), &made);
-    out = Ref<Interface>::Adopt(result < 0 ? nullptr : static_cast<Interface*>(made));
+    if (result < 0) {
+        ReleaseOutput(made);
+    }
+    out = Ref<Interface>::Adopt(static_cast<Interface*>(made));
     return result;
 }
 

@@ -18,7 +18,7 @@ class Refusing final : public INCFString {
 public:
     NCFRESULT QueryInterface(const GUID& iid, void** out) override {
         if (out == nullptr) {
-            return NCF_E_POINTER;
+            return NCF_E_INVALIDARG;
         }
         const bool known = iid == IID_INCFString || iid == IID_INCFUnknown;
         *out = known ? static_cast<INCFString*>(this) : nullptr;

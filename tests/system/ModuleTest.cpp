@@ -103,6 +103,20 @@ TEST_F(Module, RegistersNineComponents) {
     }
 }
 
+// A mapping hands its providers out before it prepares them. Without a movie the
+// preparation fails, and what was handed out must not keep the module.
+TEST_F(Module, AProviderThatCannotBePreparedLeavesNothingBehind) {
+    for (const GUID& provider :
+         {NMA::IID_IUncompressedImageProvider, NMA::IID_IUncompressedAudioProvider}) {
+        void* made = this;
+        EXPECT_LT(session().host().factory().CreateComponent(NMA::CompID_QuickTimeSampleMapping,
+                                                             nullptr, provider, &made),
+                  0);
+        EXPECT_EQ(made, nullptr);
+        EXPECT_TRUE(ModuleIsIdle());
+    }
+}
+
 TEST_F(Module, MakesTheComponentsThatHaveAFactory) {
     for (const ComponentRow& row : kComponents) {
         void* made = nullptr;

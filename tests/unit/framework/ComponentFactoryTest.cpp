@@ -115,6 +115,24 @@ TEST_F(ComponentFactoryTest, AMakerThatThrowsIsAFailure) {
     EXPECT_EQ(NCF_E_UNEXPECTED, Create(CompID_Capability, IID_INCFCapability));
 }
 
+TEST_F(ComponentFactoryTest, WhatAMakerHandsOutBeforeItFailsIsGivenBack) {
+    const std::int64_t before = host::LiveObjectCount();
+    factory_->Register(CompID_Capability,
+                       [](INCFUnknown*, INCFUnknown*, const GUID&, void** out) -> NCFRESULT {
+                           *out = MakeRef<Capability>().Detach();
+                           return NCF_E_FAIL;
+                       });
+    EXPECT_EQ(NCF_E_FAIL, Create(CompID_Capability, IID_INCFCapability));
+    EXPECT_EQ(before, host::LiveObjectCount());
+    factory_->Register(CompID_Capability,
+                       [](INCFUnknown*, INCFUnknown*, const GUID&, void** out) -> NCFRESULT {
+                           *out = MakeRef<Capability>().Detach();
+                           throw NCF_E_HANDLE;
+                       });
+    EXPECT_EQ(NCF_E_HANDLE, Create(CompID_Capability, IID_INCFCapability));
+    EXPECT_EQ(before, host::LiveObjectCount());
+}
+
 TEST_F(ComponentFactoryTest, AMakerMayCreateOthersAndIsGivenTheHost) {
     constexpr GUID kOuter = ncfGuid("22222222-0000-4000-8000-000000000001");
     factory_->Register(kOuter,

@@ -35,7 +35,7 @@ TEST(Component, RefusesOtherInterfacesAndNullsTheOutput) {
     void* out = settings.get();
     EXPECT_EQ(NCF_E_NOINTERFACE, settings->QueryInterface(IID_INCFComponentFactory, &out));
     EXPECT_EQ(nullptr, out);
-    EXPECT_EQ(NCF_E_POINTER, settings->QueryInterface(IID_INCFUnknown, nullptr));
+    EXPECT_EQ(NCF_E_INVALIDARG, settings->QueryInterface(IID_INCFUnknown, nullptr));
 }
 
 TEST(Component, CountsReferencesFromManyThreads) {

@@ -109,6 +109,16 @@ TEST_F(PluginModuleTest, StaysWhileAnObjectOfItLives) {
     EXPECT_EQ(NCF_CLASS_E_CLASSNOTAVAILABLE, host_.Create(kThing, thing));
 }
 
+TEST_F(PluginModuleTest, AClassFactoryThatComesWithAFailureDoesNotKeepTheModule) {
+    host::LoadFailure failure;
+    host::PluginModule* module = host_.LoadModule(Module("hands_out_and_refuses"), failure);
+    ASSERT_NE(nullptr, module) << failure.message;
+    EXPECT_FALSE(module->components()[0].hasFactory);
+    host::Ref<INCFClassFactory> thing;
+    EXPECT_EQ(NCF_E_ACCESSDENIED, host_.Create(kThing, thing));
+    EXPECT_EQ(NCF_OK, host_.UnloadModule());
+}
+
 TEST_F(PluginModuleTest, EndOfTheHostShutsARefusingModuleDown) {
     {
         host::Host brief;

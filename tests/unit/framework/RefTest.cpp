@@ -17,6 +17,25 @@ ncfUInt32 References(INCFUnknown* object) {
     return object->Release();
 }
 
+// Hands out a reference to what it holds, and fails all the same.
+class HandsOutAndFails final : public host::Component<INCFComponentFactory> {
+public:
+    explicit HandsOutAndFails(Capability& held) : held_(held) {}
+    NCFRESULT QueryInterface(const GUID&, void** out) override { return HandOut(out); }
+    NCFRESULT CreateComponent(const GUID&, INCFUnknown*, const GUID&, void** out) override {
+        return HandOut(out);
+    }
+
+private:
+    NCFRESULT HandOut(void** out) {
+        held_.AddRef();
+        *out = static_cast<INCFCapability*>(&held_);
+        return NCF_E_HANDLE;
+    }
+
+    Capability& held_;
+};
+
 }  // namespace
 
 TEST(Ref, HoldsOneReferenceAndGivesItBack) {
@@ -61,4 +80,16 @@ TEST(Ref, QueryAsksForTheInterfaceHeld) {
     EXPECT_EQ(NCF_E_NOINTERFACE, host::Query(object.get(), missing));
     EXPECT_FALSE(missing);
     EXPECT_EQ(NCF_E_POINTER, host::Query(nullptr, missing));
+}
+
+TEST(Ref, AFailedQueryOrCreationLeavesNoReferenceBehind) {
+    const Ref<Capability> held = MakeRef<Capability>();
+    const Ref<HandsOutAndFails> failing = MakeRef<HandsOutAndFails>(*held);
+    Ref<INCFCapability> found;
+    EXPECT_EQ(NCF_E_HANDLE, host::Query(failing.get(), found));
+    EXPECT_FALSE(found);
+    EXPECT_EQ(1u, References(held.get()));
+    EXPECT_EQ(NCF_E_HANDLE, host::Create(*failing, CompID_Capability, found));
+    EXPECT_FALSE(found);
+    EXPECT_EQ(1u, References(held.get()));
 }

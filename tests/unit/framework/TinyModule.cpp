@@ -137,6 +137,9 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFGetClassFactory(INCFUnknown*, const GUID& classId
     auto* made = new Counted;
     const NCFRESULT result = made->QueryInterface(interfaceId, out);
     made->Release();
+#ifdef FAULT_hands_out_and_refuses
+    return NCF_E_ACCESSDENIED;
+#endif
     return result;
 }
 #endif
