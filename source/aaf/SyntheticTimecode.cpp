@@ -16,12 +16,19 @@ namespace {
 
 NCF_FUNCTION("NMA::Impl::AddSyntheticTimeCode");
 
-// The file's last write in UTC. A date that can't be read counts as midnight.
+// The file's last write in UTC. A date that can't be read counts as midnight;
+// the line belongs to the query, though it names the conversion, which fails
+// without a word.
 std::tm FileDate(const NMAString& path) {
     std::tm utcTime{};
+    os::FileTime written = 0;
+    if (!os::GetLastWriteTime(path.GetUTF16String(), &written)) {
+        const ncfUInt32 error = os::LastError();
+        slog::Error(ncfFunction) << " - FileTimeToSystemTime, hresult: " << error;
+        return utcTime;
+    }
     os::DateTime date{};
-    if (!os::GetLastWriteTime(path.GetUTF16String(), &date)) {
-        slog::Error(ncfFunction) << " - FileTimeToSystemTime, hresult: " << os::LastError();
+    if (!os::ToDateTime(written, &date)) {
         return utcTime;
     }
     utcTime.tm_sec = date.second;

@@ -48,7 +48,7 @@ struct TrackMaker {
     NCFRESULT ReadTiming();
     NCFRESULT AddTimecodeSlots();
     NCFRESULT AddTimecodeSlot(const TimeCodeTrackMetadata& tcInfo);
-    NCFRESULT PrepareRetriever(ncfUInt32 videoTrackCount);
+    NCFRESULT PrepareRetriever(ncfUInt32 videoTrackCount, ncfUInt32 videoSlots);
     NCFRESULT AddPictureSlots();
     NCFRESULT AddSoundSlots();
 };
@@ -112,13 +112,15 @@ NCFRESULT TrackMaker::AddTimecodeSlot(const TimeCodeTrackMetadata& tcInfo) {
     return NCF_OK;
 }
 
-// A clip without video never needs the data files.
-NCFRESULT TrackMaker::PrepareRetriever(ncfUInt32 videoTrackCount) {
-    if (videoTrackCount == 0) {
-        return NCF_OK;
+// A clip without video never has the data files read. Alpha that it shows all
+// the same is a picture, and no descriptor of one is made without the retriever.
+NCFRESULT TrackMaker::PrepareRetriever(ncfUInt32 videoTrackCount, ncfUInt32 videoSlots) {
+    if (videoTrackCount != 0) {
+        NCF_RETURN(QuickTimeToAAFInfoRetriever::Init(pConsole, pComponentFactory, fourCharXML, AAFInfoXML));
     }
-    NCF_RETURN(QuickTimeToAAFInfoRetriever::Init(pConsole, pComponentFactory, fourCharXML, AAFInfoXML));
-    NCFASSERT(QuickTimeToAAFInfoRetriever::GetInstance());
+    if (videoSlots != 0) {
+        NCFASSERT(QuickTimeToAAFInfoRetriever::GetInstance());
+    }
     return NCF_OK;
 }
 
@@ -127,11 +129,11 @@ NCFRESULT TrackMaker::PrepareRetriever(ncfUInt32 videoTrackCount) {
 NCFRESULT TrackMaker::AddPictureSlots() {
     ncfUInt32 videoTrackCount = 0;
     NCF_RETURN(media->GetVideoTrackCount(&videoTrackCount));
-    const NCFRESULT prepared = PrepareRetriever(videoTrackCount);
+    const ncfUInt32 videoSlots = std::min(1u, videoTrackCount) + (media->ShowsAlpha() ? 1u : 0u);
+    const NCFRESULT prepared = PrepareRetriever(videoTrackCount, videoSlots);
     if (prepared < 0) {
         return prepared;
     }
-    const ncfUInt32 videoSlots = std::min(1u, videoTrackCount) + (media->ShowsAlpha() ? 1u : 0u);
     const aafUID_t& dataDefUID = kAAFDataDef_LegacyPicture;
     const aafCharacter slotFormatLabel[] = L"V%d";
     for (ncfUInt32 slot = 0; slot < videoSlots; ++slot) {

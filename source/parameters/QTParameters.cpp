@@ -31,9 +31,6 @@ NCFRESULT QTParameters::InitializeInstance(INCFUnknown* host) {
 }
 
 NCFRESULT QTParameters::InternalQueryInterface(const GUID& iid, void** ppvObj) {
-    if (!ppvObj) {
-        return NCF_E_INVALIDARG;
-    }
     return QueryListedInterfaces<INCFParametersXML, IParametersHandler>(this, iid, ppvObj);
 }
 

@@ -44,8 +44,5 @@ NCFRESULT CNCFClassFactory::CreateInstance(INCFUnknown* host, INCFUnknown* outer
 }
 
 NCFRESULT CNCFClassFactory::InternalQueryInterface(const GUID& iid, void** out) {
-    if (!out) {
-        return NCF_E_INVALIDARG;
-    }
     return QueryListedInterfaces<INCFClassFactory>(this, iid, out);
 }

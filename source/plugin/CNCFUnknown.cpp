@@ -35,6 +35,9 @@ void CNCFUnknown::DeleteThis() {
 }
 
 NCFRESULT CNCFUnknown::InternalQueryInterface(const GUID& iid, void** out) {
+    if (!out) {
+        return NCF_E_INVALIDARG;
+    }
     *out = nullptr;
     if (iid == IID_INCFUnknown) {
         *out = static_cast<INCFUnknown*>(&privateUnknown_);

@@ -92,6 +92,9 @@ bool AnswerInterface(Component* component, const GUID& iid, void** out) {
 // the body of a component's InternalQueryInterface.
 template <class... Interfaces, class Component>
 NCFRESULT QueryListedInterfaces(Component* component, const GUID& iid, void** out) {
+    if (!out) {
+        return NCF_E_INVALIDARG;
+    }
     if ((ncf_detail::AnswerInterface<Interfaces>(component, iid, out) || ...)) {
         return NCF_OK;
     }

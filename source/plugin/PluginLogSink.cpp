@@ -3,6 +3,9 @@
 
 #include "source/plugin/PluginLogSink.h"
 
+#include <cstddef>
+#include <new>
+
 #include "source/plugin/ResultChecks.h"
 
 namespace {
@@ -26,7 +29,9 @@ private:
 }  // namespace
 
 PluginLogSink& PluginLogSink::Instance() {
-    static PluginLogSink* const sink = new PluginLogSink;
+    // Built in place: a record asks for the sink, and none may fail for memory.
+    alignas(PluginLogSink) static std::byte place[sizeof(PluginLogSink)];
+    static PluginLogSink* const sink = new (place) PluginLogSink;
     return *sink;
 }
 
@@ -48,12 +53,21 @@ void PluginLogSink::Stop() {
     started_.store(false, std::memory_order_relaxed);
 }
 
-slog::CLoggerBaseEx& PluginLogSink::Begin(ncfUInt64 mask, const char* where, ncfUInt32 kind) {
-    if (!started_.load(std::memory_order_relaxed) || (mask & mask_) == 0 ||
-        kind == slog::kNoRecord) {
-        current_.store(&discard_, std::memory_order_relaxed);
-        return discard_;
+slog::CLoggerBaseEx& PluginLogSink::Begin(ncfUInt64 mask, const char* where,
+                                          ncfUInt32 kind) noexcept {
+    if (started_.load(std::memory_order_relaxed) && (mask & mask_) != 0 &&
+        kind != slog::kNoRecord) {
+        try {
+            return BeginInMainLogger(kind, where);
+        } catch (...) {
+            // A record that can't be begun is lost; what it tells of goes on.
+        }
     }
+    current_.store(&discard_, std::memory_order_relaxed);
+    return discard_;
+}
+
+slog::CLoggerBaseEx& PluginLogSink::BeginInMainLogger(ncfUInt32 kind, const char* where) {
     const Locked locked(*lock_.inArg());
     if (!logger_) {
         logger_.reset(maker_());

@@ -25,8 +25,9 @@ public:
     void Stop();
 
     // Chooses the logger of one record and begins it. Not started, a mask
-    // without a common bit, or kNoRecord: the discard logger.
-    slog::CLoggerBaseEx& Begin(ncfUInt64 mask, const char* where, ncfUInt32 kind);
+    // without a common bit, kNoRecord, or a main logger that fails: the discard
+    // logger.
+    slog::CLoggerBaseEx& Begin(ncfUInt64 mask, const char* where, ncfUInt32 kind) noexcept;
 
     slog::CLoggerBaseEx& CurrentLogger() { return *current_.load(std::memory_order_relaxed); }
 
@@ -36,6 +37,8 @@ public:
 
 private:
     PluginLogSink();
+
+    slog::CLoggerBaseEx& BeginInMainLogger(ncfUInt32 kind, const char* where);
 
     std::unique_ptr<slog::CLoggerBaseEx> logger_;
     slog::CNullLoggerEx discard_;

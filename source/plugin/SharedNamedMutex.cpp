@@ -26,8 +26,9 @@ const char* TextOf(os::Wait outcome) {
 
 SharedNamedMutex::SharedNamedMutex(const char* name) : handle_(os::CreateNamedMutex(name)) {
     if (!handle_) {
+        const ncfUInt32 error = os::LastError();
         std::cout << "Error create shared mutex" << (name ? name : "")
-                  << "err: " << os::ErrorText(os::LastError()) << std::endl;
+                  << "err: " << os::ErrorText(error) << std::endl;
     }
 }
 
@@ -43,12 +44,12 @@ void SharedNamedMutex::Lock() {
         return;
     }
     const os::Wait outcome = os::WaitForMutex(handle_);
+    const ncfUInt32 error = os::LastError();
     if (outcome == os::Wait::kAcquired) {
         owningThread_ = thread;
         owningModule_ = module;
         return;
     }
-    const ncfUInt32 error = os::LastError();
     std::cout << TextOf(outcome) << "Lock shared mutex: " << handle_
               << "; code: " << os::ErrorText(error) << std::endl;
 }

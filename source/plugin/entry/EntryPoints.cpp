@@ -69,6 +69,16 @@ NMAString ModulePath() {
     return NMAStringUtils::CreateWCharNMAString(path.c_str(), -1);
 }
 
+// The folder of a path as a host string of its own, so that a refused string is
+// seen here and not by whoever reads it later.
+NCFSmartPtr<INCFString> FolderOf(const NMAString& path) {
+    NCFSmartPtr<INCFString> folder;
+    ThrowIfFailed(NMAString::CreateString(folder.outArg()));
+    ThrowIfFailed(folder->AssignUTF16(
+        kNCFWCHAR, NMAStringUtils::GetParentFolder(path).GetUTF16String(), kNCFZeroTerminated));
+    return folder;
+}
+
 }  // namespace
 
 NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterPlugin(INCFUnknown* host,
@@ -157,7 +167,7 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFStartup(INCFUnknown* host) {
         PluginLogger().SetName(kPluginName);
         PluginLogSink::Instance().Start(factory.inArg());
         LogVersionInfo(&PluginLogger(), kPluginName, modulePath);
-        SetPluginFolder(NMAStringUtils::GetParentFolder(modulePath).InArg());
+        SetPluginFolder(FolderOf(modulePath).inArg());
     });
 }
 

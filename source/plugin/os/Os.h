@@ -46,9 +46,12 @@ void ExpectLargeBlock(void* memory, std::size_t bytes);
 
 // --- dates -----------------------------------------------------------------
 
+// A point in time as the system counts it.
+using FileTime = ncfSInt64;
+
 // A point in time in UTC.
 struct DateTime {
-    int year;       // 1601 and later
+    int year;       // 1601 to 30827
     int month;      // 1 to 12
     int day;        // 1 to 31
     int dayOfWeek;  // 0 Sunday
@@ -57,8 +60,11 @@ struct DateTime {
     int second;
 };
 
-// Date of the last write to a file.
-bool GetLastWriteTime(const std::u16string& path, DateTime* date);
+// Time of the last write to a file.
+bool GetLastWriteTime(const std::u16string& path, FileTime* time);
+// false for a time before or behind the years of a DateTime, as file systems
+// may bear it.
+bool ToDateTime(FileTime time, DateTime* date);
 
 // --- the module ------------------------------------------------------------
 

@@ -197,13 +197,19 @@ void ExpectLargeBlock(void* memory, std::size_t bytes) {
 #endif
 }
 
-bool GetLastWriteTime(const std::u16string& path, DateTime* date) {
+bool GetLastWriteTime(const std::u16string& path, FileTime* time) {
     struct stat status {};
     if (stat(SystemPath(path).c_str(), &status) != 0) {
         return Fail(errno);
     }
+    *time = status.st_mtime;
+    return true;
+}
+
+bool ToDateTime(FileTime time, DateTime* date) {
+    const auto seconds = static_cast<time_t>(time);
     struct tm utc {};
-    if (!gmtime_r(&status.st_mtime, &utc)) {
+    if (!gmtime_r(&seconds, &utc) || utc.tm_year < 1601 - 1900 || utc.tm_year > 30827 - 1900) {
         return Fail(EOVERFLOW);
     }
     *date = {utc.tm_year + 1900, utc.tm_mon + 1, utc.tm_mday, utc.tm_wday,
@@ -340,8 +346,7 @@ void CloseMutex(void* mutex) {
 }
 
 ncfUInt64 CurrentThreadId() {
-    static thread_local char marker;
-    return reinterpret_cast<std::uintptr_t>(&marker);
+    return static_cast<ncfUInt64>(gettid());
 }
 
 const void* OwnModule() {

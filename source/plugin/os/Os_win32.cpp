@@ -81,11 +81,22 @@ void FreeAligned(void* memory) {
 // Large pages are a privilege that a module does not ask for.
 void ExpectLargeBlock(void*, std::size_t) {}
 
-bool GetLastWriteTime(const std::u16string& path, DateTime* date) {
+bool GetLastWriteTime(const std::u16string& path, FileTime* time) {
     WIN32_FILE_ATTRIBUTE_DATA attributes{};
+    if (!::GetFileAttributesExW(Wide(path), GetFileExInfoStandard, &attributes)) {
+        return false;
+    }
+    const FILETIME& written = attributes.ftLastWriteTime;
+    *time = static_cast<FileTime>(static_cast<ncfUInt64>(written.dwHighDateTime) << 32 |
+                                  written.dwLowDateTime);
+    return true;
+}
+
+bool ToDateTime(FileTime time, DateTime* date) {
+    const FILETIME written = {static_cast<DWORD>(time),
+                              static_cast<DWORD>(static_cast<ncfUInt64>(time) >> 32)};
     SYSTEMTIME utc{};
-    if (!::GetFileAttributesExW(Wide(path), GetFileExInfoStandard, &attributes) ||
-        !::FileTimeToSystemTime(&attributes.ftLastWriteTime, &utc)) {
+    if (!::FileTimeToSystemTime(&written, &utc)) {
         return false;
     }
     *date = {utc.wYear, utc.wMonth, utc.wDay, utc.wDayOfWeek, utc.wHour, utc.wMinute, utc.wSecond};

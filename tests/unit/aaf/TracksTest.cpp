@@ -250,6 +250,24 @@ TEST_F(TracksTest, IgnoredAlphaShowsNothing) {
     EXPECT_EQ(Slots(), Chain(2));
 }
 
+TEST_F(TracksTest, AlphaWithoutAVideoTrackNeedsARetrieverBeforeAnyDescriptor) {
+    clip->videoTracks = 0;
+    clip->timecode.resize(1);
+    clip->setAlpha(true, false);
+    const std::string missing =
+        std::string("NCFASSERT( QuickTimeToAAFInfoRetriever::GetInstance() )") + kFunction;
+    EXPECT_EQ(Add(), NCF_E_FAIL);
+    EXPECT_EQ(log.count(missing), 1);
+    EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance(), nullptr) << "no track: no data files";
+    EXPECT_TRUE(aaf.linesOf("Dictionary.CreateInstance AUID_AAFCDCIDescriptor").empty());
+    EXPECT_EQ(aaf.place("CDCIDescriptor1"), -1);
+
+    StartRetriever();  // as a clip described before has done
+    EXPECT_EQ(Add(), NCF_OK);
+    EXPECT_EQ(log.count(missing), 1);
+    EXPECT_EQ(aaf.linesOf("MultipleDescriptor1.AppendFileDescriptor").size(), 1u);
+}
+
 TEST_F(TracksTest, ATrackWithoutChannelsHasADescriptorAndNoSlot) {
     clip->videoTracks = 0;
     clip->timecode.resize(1);

@@ -81,6 +81,14 @@ TEST_F(Component, RefusesAnUnknownInterfaceAndNullsTheOutput) {
               (std::vector<std::string>{"made", "initialized", "final release", "destroyed"}));
 }
 
+TEST_F(Component, RefusesAQueryWithoutOutput) {
+    TestComponent object(nullptr);
+    EXPECT_EQ(object.InternalQueryInterface(IID_First, nullptr), NCF_E_INVALIDARG);
+    EXPECT_EQ(object.InternalQueryInterface(IID_LockComponent, nullptr), NCF_E_INVALIDARG);
+    EXPECT_EQ(object.CNCFUnknown::InternalQueryInterface(IID_INCFUnknown, nullptr),
+              NCF_E_INVALIDARG);
+}
+
 TEST_F(Component, IsDestroyedWithoutFinalReleaseWhenInitializingFails) {
     TestComponent::initializeResult = NCF_E_HANDLE;
     void* out = reinterpret_cast<void*>(&host);

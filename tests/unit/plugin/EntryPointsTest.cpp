@@ -441,6 +441,25 @@ TEST_F(EntryPoints, StartupGivesTheRefusalOfTheFactoryOrTheLock) {
     EXPECT_EQ(GetPluginFolder(), nullptr);
 }
 
+TEST_F(EntryPoints, StartupGivesTheRefusalOfItsFolderString) {
+    host.refuseCreation(NCFCompID_NCFString, NCF_E_ACCESSDENIED);
+    EXPECT_EQ(NCFStartup(host.unknown()), NCF_E_ACCESSDENIED);
+    EXPECT_EQ(GetPluginFolder(), nullptr);
+    EXPECT_EQ(NCFShutdown(host.unknown()), NCF_OK);
+    EXPECT_EQ(NCFShutdown(host.unknown()), NCF_OK);
+    host.clearRefusals();
+    EXPECT_EQ(NCFStartup(host.unknown()), NCF_OK) << "and it starts again";
+    EXPECT_NE(GetPluginFolder(), nullptr);
+}
+
+TEST_F(EntryPoints, ARefusedFolderStringLeavesTheFolderOfAStartBefore) {
+    ASSERT_EQ(NCFStartup(host.unknown()), NCF_OK);
+    INCFString* const before = GetPluginFolder();
+    host.refuseCreation(NCFCompID_NCFString, NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(NCFStartup(host.unknown()), NCF_E_OUTOFMEMORY);
+    EXPECT_EQ(GetPluginFolder(), before);
+}
+
 TEST_F(EntryPoints, StartupNeedsAHost) {
     EXPECT_EQ(NCFStartup(nullptr), NCF_E_POINTER);
 }
@@ -477,6 +496,31 @@ TEST_F(EntryPoints, ShutdownClearsTheFolderThenTheRetrieverThenSaysUnloaded) {
     EXPECT_EQ(journal.lines(), (std::vector<std::string>{"retriever down, folder cleared",
                                                          "log 4: QuickTime Plug-In Unloaded"}));
     EXPECT_EQ(GetPluginFolder(), nullptr);
+}
+
+// A lock that looks, when it goes, whether the utility library still holds the
+// factory.
+class LastLook : public FakeLock {
+public:
+    LastLook(FakeHost& host, ncfUInt32& references) : host_(host), references_(references) {}
+    ~LastLook() override { references_ = host_.references(); }
+
+private:
+    FakeHost& host_;
+    ncfUInt32& references_;
+};
+
+TEST_F(EntryPoints, ShutdownStopsTheSinkBeforeTheUtilityLibrary) {
+    ncfUInt32 references = 0;
+    host.maker(CompID_LockComponent, [&](const GUID&, void** out) {
+        *out = static_cast<INCFLock*>(new LastLook(host, references));
+        return NCF_OK;
+    });
+    ASSERT_EQ(NCFStartup(host.unknown()), NCF_OK);
+    const ncfUInt32 started = host.references();
+    EXPECT_EQ(NCFShutdown(host.unknown()), NCF_OK);
+    EXPECT_EQ(references, started) << "the sink's lock goes while the library is at work";
+    EXPECT_LT(host.references(), started);
 }
 
 TEST_F(EntryPoints, ShutdownIsHarmlessBeforeStartupAndTwice) {

@@ -3,18 +3,41 @@
 
 #include "source/plugin/os/Os.h"
 
+#include <dlfcn.h>
+#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/stat.h>
+#include <sys/statfs.h>
+#include <sys/statvfs.h>
 #include <unistd.h>
-
-#include <fcntl.h>
 
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
+#include <limits>
 #include <string>
+#include <thread>
+
+namespace {
+
+// Block size that the volume of every file claims to have; 0: its own.
+unsigned long toldBlockSize = 0;
+
+}  // namespace
+
+// The program's own function comes before the system's.
+extern "C" int fstatvfs(int file, struct statvfs* volume) noexcept {
+    struct statfs known {};
+    if (fstatfs(file, &known) != 0) {
+        return -1;
+    }
+    *volume = {};
+    volume->f_bsize =
+        toldBlockSize != 0 ? toldBlockSize : static_cast<unsigned long>(known.f_bsize);
+    return 0;
+}
 
 namespace {
 
@@ -24,7 +47,10 @@ protected:
         std::filesystem::remove_all(folder);
         std::filesystem::create_directories(folder);
     }
-    ~OperatingSystem() override { std::filesystem::remove_all(folder); }
+    ~OperatingSystem() override {
+        toldBlockSize = 0;
+        std::filesystem::remove_all(folder);
+    }
 
     std::u16string write(const std::string& name, const std::string& bytes) {
         std::ofstream(folder / name, std::ios::binary) << bytes;
@@ -118,20 +144,62 @@ TEST_F(OperatingSystem, OpensANameThatIsNoUtf8) {
     os::Close(file);
 }
 
-TEST_F(OperatingSystem, OpensANameOutsideTheBasicPlane) {
-    const std::u16string path = write("\xF0\x9F\x8E\xAC.mov", "bytes");
-    const os::FileHandle file = os::OpenForReading(path);
-    EXPECT_NE(file, os::kNoFile);
-    os::Close(file);
+// A name's bytes and its UTF-16 form. Bytes that are no UTF-8 stand as lone
+// surrogates, each for itself.
+struct Name {
+    const char* bytes;
+    std::u16string units;
+};
+const Name kNames[] = {
+    {"\x80", {0xDC80}},
+    {"\xFF", {0xDCFF}},
+    {"\x7F\xC2\x80", {0x7F, 0x80}},
+    {"\xDF\xBF\xE0\xA0\x80", {0x7FF, 0x800}},
+    {"\xED\x9F\xBF", {0xD7FF}},
+    {"\xEE\x80\x80", {0xE000}},
+    {"\xEF\xBF\xBF", {0xFFFF}},
+    {"\xF0\x90\x80\x80", {0xD800, 0xDC00}},
+    {"\xF0\x9F\x8E\xAC", {0xD83C, 0xDFAC}},
+    {"\xF4\x8F\xBF\xBF", {0xDBFF, 0xDFFF}},
+    // A surrogate's own bytes, a form that is too long, a number too high, and
+    // one that ends too early.
+    {"\xED\xA0\x80", {0xDCED, 0xDCA0, 0xDC80}},
+    {"\xED\xBF\xBF", {0xDCED, 0xDCBF, 0xDCBF}},
+    {"\xC1\xBF", {0xDCC1, 0xDCBF}},
+    {"\xE0\x9F\xBF", {0xDCE0, 0xDC9F, 0xDCBF}},
+    {"\xF0\x8F\xBF\xBF", {0xDCF0, 0xDC8F, 0xDCBF, 0xDCBF}},
+    {"\xF4\x90\x80\x80", {0xDCF4, 0xDC90, 0xDC80, 0xDC80}},
+    {"\xE2\x82", {0xDCE2, 0xDC82}},
+    {"\xF8\x88", {0xDCF8, 0xDC88}},
+};
+
+TEST_F(OperatingSystem, OpensNamesOfEveryForm) {
+    for (const Name& name : kNames) {
+        std::ofstream(folder.string() + "/" + name.bytes + ".mov") << name.bytes;
+        const os::FileHandle file = os::OpenForReading(pathOf("") + name.units + u".mov");
+        EXPECT_NE(file, os::kNoFile) << testing::PrintToString(name.units);
+        ncfUInt64 size = 0;
+        EXPECT_TRUE(os::GetFileSize(file, &size));
+        EXPECT_EQ(size, std::strlen(name.bytes));
+        os::Close(file);
+    }
 }
 
-TEST_F(OperatingSystem, GivesASectorSizeThatIsAPowerOfTwoOrNone) {
+TEST_F(OperatingSystem, BelievesSectorSizesOfPowersOfTwoFrom512To65536) {
     const os::FileHandle file = os::OpenForReading(write("a.bin", "x"));
-    ncfUInt32 bytes = 0;
-    if (os::GetSectorSize(file, u"", &bytes)) {
-        EXPECT_GE(bytes, 512u);
-        EXPECT_LE(bytes, 65536u);
-        EXPECT_EQ(bytes & (bytes - 1), 0u);
+    for (const unsigned long size : {512ul, 4096ul, 65536ul}) {
+        toldBlockSize = size;
+        ncfUInt32 bytes = 0;
+        EXPECT_TRUE(os::GetSectorSize(file, u"", &bytes)) << size;
+        EXPECT_EQ(bytes, size);
+    }
+    for (const unsigned long size :
+         {1ul, 256ul, 511ul, 513ul, 3072ul, 65535ul, 131072ul, 1048576ul}) {
+        toldBlockSize = size;
+        ncfUInt32 bytes = 7;
+        EXPECT_FALSE(os::GetSectorSize(file, u"", &bytes)) << size;
+        EXPECT_EQ(bytes, 7u);
+        EXPECT_EQ(os::LastError(), static_cast<ncfUInt32>(ERANGE));
     }
     os::Close(file);
 }
@@ -140,8 +208,10 @@ TEST_F(OperatingSystem, TellsTheLastWriteInUtc) {
     const std::u16string path = write("a.bin", "x");
     struct timespec times[2] = {{86399, 0}, {86399, 0}};
     ASSERT_EQ(utimensat(AT_FDCWD, (folder / "a.bin").c_str(), times, 0), 0);
+    os::FileTime written = 0;
     os::DateTime date{};
-    ASSERT_TRUE(os::GetLastWriteTime(path, &date));
+    ASSERT_TRUE(os::GetLastWriteTime(path, &written));
+    ASSERT_TRUE(os::ToDateTime(written, &date));
     EXPECT_EQ(date.year, 1970);
     EXPECT_EQ(date.month, 1);
     EXPECT_EQ(date.day, 1);
@@ -149,7 +219,37 @@ TEST_F(OperatingSystem, TellsTheLastWriteInUtc) {
     EXPECT_EQ(date.hour, 23);
     EXPECT_EQ(date.minute, 59);
     EXPECT_EQ(date.second, 59);
-    EXPECT_FALSE(os::GetLastWriteTime(pathOf("absent"), &date));
+    EXPECT_FALSE(os::GetLastWriteTime(pathOf("absent"), &written));
+    EXPECT_EQ(os::LastError(), static_cast<ncfUInt32>(ENOENT));
+}
+
+TEST_F(OperatingSystem, ConvertsTimesOfTheYears1601To30827Only) {
+    constexpr os::FileTime kFirst = -11644473600;  // 1601-01-01, 00:00:00
+    constexpr os::FileTime kLast = 910670515199;   // 30827-12-31, 23:59:59
+    os::DateTime date{};
+    ASSERT_TRUE(os::ToDateTime(kFirst, &date));
+    EXPECT_EQ(date.year, 1601);
+    EXPECT_EQ(date.month, 1);
+    EXPECT_EQ(date.day, 1);
+    EXPECT_FALSE(os::ToDateTime(kFirst - 1, &date));
+    ASSERT_TRUE(os::ToDateTime(kLast, &date));
+    EXPECT_EQ(date.year, 30827);
+    EXPECT_FALSE(os::ToDateTime(kLast + 1, &date));
+    EXPECT_FALSE(os::ToDateTime(std::numeric_limits<os::FileTime>::max(), &date));
+    EXPECT_FALSE(os::ToDateTime(std::numeric_limits<os::FileTime>::min(), &date));
+}
+
+TEST_F(OperatingSystem, TellsThreadsApartAlsoOnceOneHasEnded) {
+    const ncfUInt64 own = os::CurrentThreadId();
+    EXPECT_EQ(os::CurrentThreadId(), own);
+    EXPECT_EQ(own, static_cast<ncfUInt64>(getpid())) << "the first thread's number";
+    ncfUInt64 first = 0;
+    ncfUInt64 second = 0;
+    std::thread([&] { first = os::CurrentThreadId(); }).join();
+    std::thread([&] { second = os::CurrentThreadId(); }).join();
+    EXPECT_NE(first, own);
+    EXPECT_NE(second, own);
+    EXPECT_NE(first, second) << "the second stands where the first did";
 }
 
 TEST_F(OperatingSystem, FindsTheModuleThatHoldsAnAddress) {
@@ -158,6 +258,67 @@ TEST_F(OperatingSystem, FindsTheModuleThatHoldsAnAddress) {
     EXPECT_EQ(path.front(), L'/');
     EXPECT_NE(path.find(L"test_plugin"), std::wstring::npos);
     EXPECT_FALSE(os::GetModulePath(nullptr, &path));
+}
+
+// Loads a copy of a small library by a name relative to the working folder, as
+// the system then keeps it.
+class ModulePath : public OperatingSystem {
+protected:
+    ~ModulePath() override { std::filesystem::current_path(former_); }
+
+    std::wstring PathOfACopyIn(const std::string& subfolder) {
+        std::filesystem::create_directories(folder.string() + "/" + subfolder);
+        const std::string copy = subfolder + "/library.so";
+        std::filesystem::copy_file(OS_TEST_LIBRARY, folder.string() + "/" + copy);
+        std::filesystem::current_path(folder);
+        void* const library = dlopen(("./" + copy).c_str(), RTLD_NOW);
+        EXPECT_NE(library, nullptr) << dlerror();
+        std::wstring path;
+        EXPECT_TRUE(os::GetModulePath(dlsym(library, "OsTestLibrary"), &path));
+        dlclose(library);
+        std::filesystem::current_path(former_);
+        return path;
+    }
+    bool IsMapped(const std::string& name) const {
+        void* const library =
+            dlopen((folder.string() + "/" + name).c_str(), RTLD_NOW | RTLD_NOLOAD);
+        if (library) {
+            dlclose(library);
+        }
+        return library != nullptr;
+    }
+
+private:
+    const std::filesystem::path former_ = std::filesystem::current_path();
+};
+
+TEST_F(ModulePath, IsMadeAbsolute) {
+    const std::wstring path = PathOfACopyIn("plug-ins");
+    EXPECT_EQ(path, folder.wstring() + L"/./plug-ins/library.so");
+}
+
+TEST_F(ModulePath, CarriesBytesThatAreNoUtf8) {
+    for (const Name& name : kNames) {
+        std::wstring wide;
+        for (std::size_t i = 0; i < name.units.size(); ++i) {
+            const wchar_t unit = name.units[i];
+            const bool isPair = unit >= 0xD800 && unit < 0xDC00;
+            wide += isPair ? 0x10000 + ((unit - 0xD800) << 10) + (name.units[++i] - 0xDC00) : unit;
+        }
+        const std::wstring path = PathOfACopyIn(name.bytes);
+        EXPECT_EQ(path, folder.wstring() + L"/./" + wide + L"/library.so");
+    }
+}
+
+TEST_F(ModulePath, KeepsTheModuleThatAskedMapped) {
+    PathOfACopyIn("asked");
+    EXPECT_TRUE(IsMapped("asked/library.so"));
+    std::filesystem::copy_file(OS_TEST_LIBRARY, folder / "other.so");
+    void* const other = dlopen((folder / "other.so").c_str(), RTLD_NOW);
+    ASSERT_NE(other, nullptr);
+    EXPECT_TRUE(IsMapped("other.so"));
+    dlclose(other);
+    EXPECT_FALSE(IsMapped("other.so")) << "one that did not ask goes";
 }
 
 TEST_F(OperatingSystem, RefusesAPositionThatNoFileHas) {

@@ -128,12 +128,44 @@ TEST_F(Sink, ThrowsWhenItsLockIsNotThereAndStaysStopped) {
     EXPECT_EQ(loggersMade, 0);
 }
 
-TEST_F(Sink, GivesItsLockBackWhenNoMainLoggerCanBeMade) {
+TEST_F(Sink, DiscardsWhenNoMainLoggerCanBeMadeAndGivesItsLockBack) {
     sink.SetLoggerMaker([]() -> slog::CLoggerBaseEx* { throw std::bad_alloc(); });
     sink.Start(host.factory());
     journal.clear();
-    EXPECT_THROW(sink.Begin(1, "Somewhere", slog::kError), std::bad_alloc);
+    slog::CLoggerBaseEx& chosen = sink.Begin(1, "Somewhere", slog::kError);
+    EXPECT_NE(dynamic_cast<slog::CNullLoggerEx*>(&chosen), nullptr);
+    EXPECT_EQ(&sink.CurrentLogger(), &chosen);
     EXPECT_EQ(journal.lines(), (std::vector<std::string>{"lock", "unlock"}));
+}
+
+TEST_F(Sink, DiscardsARecordThatItsMainLoggerCannotBegin) {
+    struct Throwing final : slog::CLoggerBaseEx {
+        void BeginRecord(ncfUInt32, const char*) override { throw std::bad_alloc(); }
+        void Hook() override {}
+        void SetFlag(ncfUInt32) override {}
+        void WriteDouble(double) override {}
+        void WriteSInt64(ncfSInt64) override {}
+        void WriteUInt64(ncfUInt64) override {}
+        void WriteUInt32(ncfUInt32) override {}
+        void WriteSInt32(ncfSInt32) override {}
+        void WriteString(const char*) override {}
+        void Manipulate(std::ios_base& (*)(std::ios_base&)) override {}
+        void EndRecord() override {}
+    };
+    sink.SetLoggerMaker([]() -> slog::CLoggerBaseEx* { return new Throwing; });
+    sink.Start(host.factory());
+    slog::CLoggerBaseEx& chosen = sink.Begin(1, "Somewhere", slog::kError);
+    EXPECT_NE(dynamic_cast<slog::CNullLoggerEx*>(&chosen), nullptr);
+    EXPECT_EQ(&sink.CurrentLogger(), &chosen);
+}
+
+TEST_F(Sink, MakesItsMainLoggerCurrentForARecord) {
+    sink.Start(host.factory());
+    slog::CLoggerBaseEx& chosen = sink.Begin(1, "Somewhere", slog::kError);
+    EXPECT_NE(dynamic_cast<CountingLogger*>(&chosen), nullptr);
+    EXPECT_EQ(&sink.CurrentLogger(), &chosen);
+    sink.Begin(2, "Somewhere", slog::kError);
+    EXPECT_NE(&sink.CurrentLogger(), &chosen) << "until a record is discarded";
 }
 
 TEST_F(Sink, DiscardsAfterItWasStopped) {

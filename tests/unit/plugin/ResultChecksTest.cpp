@@ -75,18 +75,22 @@ TEST_F(Checks, FailedAssertionIsRecordedAndFails) {
     EXPECT_EQ(Assert(1, 0), NCF_E_FAIL);
     EXPECT_EQ(only().text, "NCFASSERT( left && right )Checks::Assert");
     EXPECT_EQ(only().kind, slog::kError);
+    EXPECT_TRUE(only().flagged);
 }
 
 TEST_F(Checks, FailureIsRecordedInHexadecimalAndReturnedUnchanged) {
     EXPECT_EQ(Return(NMA_E_NODATA), NMA_E_NODATA);
     EXPECT_EQ(only().text, "NCF_RETURN(0xa000006f): Answer(result) : Checks::Return");
     EXPECT_EQ(only().kind, slog::kError);
+    EXPECT_TRUE(only().flagged);
     EXPECT_EQ(evaluations, 1);
 }
 
 TEST_F(Checks, SkippedFailureIsRecordedAndTheFunctionGoesOn) {
     EXPECT_EQ(Skip(NCF_E_HANDLE), 7);
     EXPECT_EQ(only().text, "NCF_SKIP(0x80000006): Answer(result) : Checks::Skip");
+    EXPECT_EQ(only().kind, slog::kError);
+    EXPECT_TRUE(only().flagged);
     EXPECT_EQ(evaluations, 1);
 }
 
@@ -98,6 +102,22 @@ TEST_F(Checks, SuccessWritesNothing) {
     EXPECT_EQ(Return(1), 7) << "only negative results are failures";
     EXPECT_EQ(Skip(NCF_OK), 7);
     EXPECT_TRUE(log.records().empty());
+}
+
+TEST_F(Checks, OnlyRecordsOfErrorsAreFlagged) {
+    slog::Progress("Checks::Tell") << " tells";
+    slog::Warning("Checks::Warn") << " warns";
+    slog::Error("Checks::Fail") << " fails";
+    ASSERT_EQ(log.records().size(), 3u);
+    const LoggedRecord expected[] = {{0, "Checks::Tell", "Checks::Tell tells", false},
+                                     {2, "Checks::Warn", "Checks::Warn warns", false},
+                                     {1, "Checks::Fail", "Checks::Fail fails", true}};
+    for (int i = 0; i < 3; ++i) {
+        EXPECT_EQ(log.records()[i].kind, expected[i].kind);
+        EXPECT_EQ(log.records()[i].where, expected[i].where);
+        EXPECT_EQ(log.records()[i].text, expected[i].text);
+        EXPECT_EQ(log.records()[i].flagged, expected[i].flagged);
+    }
 }
 
 TEST_F(Checks, ThrowsANegativeResultAsAResult) {

@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+#include <iostream>
+#include <sstream>
 #include <string>
 
 #include "source/plugin/SharedNamedMutex.h"
@@ -17,6 +19,7 @@ struct ToldOs {
     bool releaseFails = false;
     ncfUInt64 thread = 1;
     const void* module = nullptr;
+    ncfUInt32 error = 17;
     int waits = 0;
     int releases = 0;
     int closes = 0;
@@ -28,7 +31,7 @@ ToldOs told;
 namespace os {
 
 ncfUInt32 LastError() {
-    return 17;
+    return told.error;
 }
 std::string ErrorText(ncfUInt32 error) {
     return "error " + std::to_string(error);
@@ -123,6 +126,29 @@ TEST_F(MutexOutcomes, EndWithAReleaseAndAClose) {
 TEST_F(MutexOutcomes, TellThatItCouldNotBeMade) {
     EXPECT_EQ(Said([] { SharedNamedMutex mutex(nullptr); }),
               "Error create shared mutexerr: error 17\n");
+}
+
+// Standard output that leaves an error number of its own with each write.
+class FailingOutput : public std::stringbuf {
+protected:
+    std::streamsize xsputn(const char* text, std::streamsize size) override {
+        told.error = 25;
+        return std::stringbuf::xsputn(text, size);
+    }
+};
+
+TEST_F(MutexOutcomes, TellTheErrorOfTheFailedCallNotOfTheOutput) {
+    FailingOutput output;
+    std::streambuf* const former = std::cout.rdbuf(&output);
+    { SharedNamedMutex mutex(nullptr); }
+    told.error = 17;
+    told.outcome = os::Wait::kFailed;
+    SharedNamedMutex mutex("name");
+    mutex.Lock();
+    std::cout.rdbuf(former);
+    const std::string said = output.str();
+    EXPECT_EQ(said.rfind("Error create shared mutexerr: error 17\n", 0), 0u) << said;
+    EXPECT_NE(said.find("; code: error 17"), std::string::npos) << said;
 }
 
 }  // namespace

@@ -29,6 +29,13 @@ TEST(UTF16Literal, KeepsCharactersBeyondSixteenBits) {
     EXPECT_EQ(std::u16string(literal.GetUTF16()), u"a\U0001F3ACb");
 }
 
+TEST(UTF16Literal, MakesPairsFromTheFirstToTheLastCharacterBeyondSixteenBits) {
+    const ncfUTF16LiteralToUTF16 literal(L"\xFFFF\x10000\x103FF\x10400\x10FFFF");
+    const ncfUTF16 expected[] = {0xFFFF, 0xD800, 0xDC00, 0xD800, 0xDFFF,
+                                 0xD801, 0xDC00, 0xDBFF, 0xDFFF, 0};
+    EXPECT_EQ(std::u16string(literal.GetUTF16()), expected);
+}
+
 TEST(UTF16Literal, ThrowsTextForANullLiteral) {
     EXPECT_EQ(Thrown([] { ncfUTF16LiteralToUTF16 literal(nullptr); }),
               "ncfUTF16LiteralToUTF16::ncfUTF16LiteralToUTF16(ncfStringLiteralRef rhs) failed with "
