@@ -167,6 +167,17 @@ TEST_F(VolumeInfo, IsNamedAfterTheLastComponentOfItsPath) {
     EXPECT_EQ(nameOf("\\m\\\xF0\x9F\x8E\xAC"), "\xF0\x9F\x8E\xAC");
 }
 
+TEST_F(VolumeInfo, DropsOneBackslashAtTheEndOfItsPathAlone) {
+    EXPECT_EQ(nameOf("C:\\media\\clips\\\\"), "");
+    EXPECT_EQ(nameOf("\\"), "");
+}
+
+TEST_F(VolumeInfo, TakesASlashForAPartOfItsName) {
+    EXPECT_EQ(nameOf("/media/clips"), "") << "there is no backslash";
+    EXPECT_EQ(nameOf("C:\\media/clips"), "media/clips");
+    EXPECT_EQ(nameOf("C:\\media/clips/"), "media/clips/");
+}
+
 TEST_F(VolumeInfo, HasNoNameWithoutAPath) {
     NCFSmartPtr<INCFString> name;
     EXPECT_EQ(infoFor(text(""))->GetVolumeName(name.outArg()), NMA_E_NOTINITIALIZED);
