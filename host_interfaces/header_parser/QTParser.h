@@ -34,7 +34,7 @@ struct IQTParser : INCFUnknown {
     virtual NCFRESULT ParseHeaders(const ncfUInt8* begin, const ncfUInt8* end,
                                    ncfUInt64 position) = 0;
     // 19. Offset and size of the next read, valid after QT_E_MOREDATA. The
-    // size is at most 1 MiB, except for the header itself, and never 0.
+    // size is at most 1 MiB and never 0: a longer header is asked for in pieces.
     virtual NCFRESULT GetRecomendedReadPosition(ncfUInt64* position, ncfUInt32* size) = 0;
     // 20. Start address and rate of the first timecode track. `drop` is 0 or
     // 1; `numFrames` is the number of frames in a second of its counting.

@@ -78,9 +78,9 @@ private:
     // The wrapper's question about the kind of a track.
     using TrackTest = ncfBool (QTWrapper::IQuickTimeWrapper::*)(ncfUInt32);
 
-    // The most tracks that are walked, and the highest number that is asked
-    // about: a wrapper that tells more is not believed, since each walk would
-    // cost as many questions.
+    // The highest track number that is asked about. A walk costs a question for
+    // each number, so one over more is cut off here; the count that the wrapper
+    // tells is handed on as it is.
     static constexpr ncfUInt32 kMostTracks = 65535;
 
     ncfUInt32 HighestTrack() const;

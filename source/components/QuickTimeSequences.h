@@ -7,8 +7,8 @@
 
 namespace NMA::Impl {
 
-// Movies have no sequences. No class id reaches this component; it stands for
-// hosts that ask a plug-in's objects for both interfaces.
+// Movies have no sequences, and both interfaces say so. The creation function is
+// there, but no class id reaches it: neither a host nor the module makes one.
 class QuickTimeSequences final : public CNCFComponent<ISequences, IAAFSequences> {
 public:
     explicit QuickTimeSequences(INCFUnknown* outer) : CNCFComponent(outer) {}

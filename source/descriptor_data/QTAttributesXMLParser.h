@@ -55,8 +55,9 @@ private:
     NMA::XMLUtils::NMAXmlElement* root_ = nullptr;  // owned by the document
 };
 
-// Reads a label of the form 8-4-4-4-12 hexadecimal digits in either case.
-// false, with the output untouched, for any other text.
+// Reads a label of the form 8-4-4-4-12 hexadecimal digits in either case. A
+// number may have fewer digits, and what follows the last isn't looked at.
+// false, with the output untouched, where fewer than all numbers are there.
 bool StringToGUID(const NMAString& text, GUID* out);
 
 }  // namespace ParseHelperFunctions

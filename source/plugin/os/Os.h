@@ -11,11 +11,12 @@
 // system is chosen by the build; nothing outside this folder names a system
 // call. A third body must keep what is said here. Paths are UTF-16 with
 // backslashes; a lone surrogate U+DC00 + b stands for the byte b of a name that
-// is no UTF-8. Functions that fail say so in their result and leave the
-// system's error number in LastError() of the calling thread.
+// is no UTF-8. Functions that fail say so in their result; those of files,
+// dates and mutexes leave the system's error number in LastError() of the
+// calling thread.
 namespace os {
 
-// The system's error number of the last failed call on this thread.
+// The error number that the last of those calls that failed left on this thread.
 ncfUInt32 LastError();
 
 // --- files -----------------------------------------------------------------
@@ -92,7 +93,8 @@ void CloseMutex(void* mutex);
 // Identity of the calling thread, and of the module that holds this code.
 ncfUInt64 CurrentThreadId();
 const void* OwnModule();
-// The system's text for an error number, UTF-8, without line end.
+// The system's text for an error number, in its own 8-bit encoding, without line
+// end.
 std::string ErrorText(ncfUInt32 error);
 
 }  // namespace os

@@ -1,7 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// What is common to both kinds of clip, seen through the one that exists:
+// What is common to both kinds of clip, seen through the one that reads headers:
 // services made on first use, sound beside picture, names.
 
 #include "tests/unit/clips/ClipFixture.h"

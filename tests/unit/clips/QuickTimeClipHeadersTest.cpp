@@ -131,11 +131,16 @@ TEST_F(QuickTimeClipLoading, ShowsZerosBehindTheEndAlsoInAUsedBuffer) {
 }
 
 TEST_F(QuickTimeClipOfLargeFile, GrowsTheBufferAndKeepsItForSmallerReads) {
-    parser->script = {{QT_E_MOREDATA, 5, 1000000}, {QT_E_MOREDATA, 1000001, 100}, {NCF_OK, 0, 0}};
+    parser->script = {{QT_E_MOREDATA, 5, 1000000},
+                      {QT_E_MOREDATA, 1000001, 100},
+                      {QT_E_MOREDATA, 7, 500000},
+                      {NCF_OK, 0, 0}};
     LoadVideo();
     EXPECT_TRUE(clip->IsLoaded());
     const auto whole = CountingBytes(1200000);
-    ASSERT_EQ(parser->fed.size(), 3u);
+    ASSERT_EQ(parser->fed.size(), 4u);
+    EXPECT_EQ(parser->fed[2].place, parser->fed[1].place) << "a smaller read";
+    EXPECT_EQ(parser->fed[3].place, parser->fed[1].place) << "a larger one that has room still";
     EXPECT_EQ(parser->fed[1].bytes,
               std::vector<ncfUInt8>(whole.begin() + 5, whole.begin() + 1000005));
     EXPECT_EQ(parser->fed[2].bytes,

@@ -134,8 +134,11 @@ TEST_F(RetrieverTest, EachFailureOfTheClipIsLoggedAndReturned) {
         log.clear();
         EXPECT_EQ(GetInfo(), NCF_E_NOTFOUND);
         ASSERT_EQ(log.records().size(), 1u) << expression;
-        EXPECT_EQ(log.records()[0].text,
-                  std::string("NCF_RETURN(0x8000000c): ") + expression + " : " + kGetInfo);
+        const std::string line =
+            std::string("NCF_RETURN(0x8000000c): ") + expression + " : " + kGetInfo;
+        EXPECT_EQ(log.records()[0].text, line);
+        EXPECT_EQ(GetInfoWithoutRecord(), NCF_E_NOTFOUND);
+        EXPECT_EQ(log.count(line), 2);
         clip_.*result = NCF_OK;
     }
 }
@@ -179,6 +182,28 @@ TEST_F(RetrieverTest, TheTableIsAskedWithTheClipsRate) {
         EXPECT_EQ(GetInfo(), NCF_E_NOTSUPPORTED) << "no record of it here";
         EXPECT_EQ(id_, id) << rate.numerator;
     }
+}
+
+// Of the two entries the first matches 1080 lines alone, the second 540.
+TEST_F(RetrieverTest, TheFileIsAskedForTheHeightOfAField) {
+    const auto entry = [](const char* height) {
+        Values values = CDCIValues();
+        for (const char* const width : {"StoredWidth", "SampledWidth", "DisplayWidth"}) {
+            values[width] = "1920";
+        }
+        values["StoredHeight"] = values["DisplayHeight"] = height;
+        return Entry("3712", "CDCI", Join(values));
+    };
+    EXPECT_EQ(Init(entry("2160") + entry("540"),
+                   "<FourCharMapping FourChar='apch'/><FourCharMapping FourChar='apch'/>"),
+              NCF_OK);
+    clip_.code = Code("apch");
+    clip_.width = 1920;
+    clip_.height = 1080;
+    EXPECT_EQ(GetInfo(), NCF_OK);
+    EXPECT_EQ(id_, 3712u);
+    EXPECT_EQ(info_.storedHeight, 540u);
+    EXPECT_EQ(info_.displayHeight, 540u);
 }
 
 TEST_F(RetrieverTest, AClipThatDoesNotTellItsLayoutIsAFullFrame) {
@@ -249,12 +274,10 @@ TEST_F(RetrieverTest, AnIdThatTheFileLacksIsNotSupported) {
 }
 
 TEST_F(RetrieverTest, TheRecordMayBeLeftOut) {
-    EXPECT_EQ(Init(Entry("1", "CDCI", Join(CDCIValues()))), NCF_OK);
-    ncfUInt32 id = 0;
-    EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(&clip_,
-                                                                                      nullptr, &id),
-              NCF_OK);
-    EXPECT_EQ(id, 1u);
+    EXPECT_EQ(Init(Entry("1", "MPEG2Video", Join(MPEG2Values()))), NCF_OK);
+    EXPECT_EQ(GetInfoWithoutRecord(), NCF_OK);
+    EXPECT_EQ(id_, 1u);
+    EXPECT_TRUE(IsMPEG());
     EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
                   &clip_, nullptr, nullptr),
               NCF_E_INVALIDARG);

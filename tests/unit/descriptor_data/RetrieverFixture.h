@@ -89,6 +89,12 @@ protected:
         return QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
             &clip_, &info_, &id_);
     }
+    // The same for a caller that wants the id alone.
+    NCFRESULT GetInfoWithoutRecord() {
+        id_ = 77;
+        return QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
+            &clip_, nullptr, &id_);
+    }
     NCFRESULT InitAndGetInfo(const std::string& kind, const Values& values) {
         EXPECT_EQ(Init(Entry("1", kind, Join(values))), NCF_OK);
         return GetInfo();

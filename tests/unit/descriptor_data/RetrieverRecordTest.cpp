@@ -154,7 +154,8 @@ const SilenceRow kSilences[] = {
 
 class SilentEntry : public RetrieverTest {
 protected:
-    // Reads an entry without `element`; the movie is as wide as what is left.
+    // Reads an entry without `element`, into a record and into none; the movie is
+    // as wide as what is left.
     void Expect(const char* kind, Values values, const char* element, bool mayBeSilent,
                 const char* getter, const char* failure = "a000006a") {
         SCOPED_TRACE(std::string(kind) + " without " + element);
@@ -170,6 +171,8 @@ protected:
                                   " on call to: " + getter + "\n";
         EXPECT_EQ(result >= 0, mayBeSilent);
         EXPECT_EQ(log.count(blame), mayBeSilent ? 0 : 1);
+        EXPECT_EQ(GetInfoWithoutRecord(), result);
+        EXPECT_EQ(log.count(blame), mayBeSilent ? 0 : 2) << "every check runs without a record";
         clip_.width = 720;
     }
 };

@@ -60,6 +60,7 @@ public:
     struct Feed {
         ncfUInt64 position;
         std::vector<ncfUInt8> bytes;
+        const ncfUInt8* place;  // where they stood in memory
     };
 
     std::vector<Step> script;  // answers of ParseHeaders in turn, then NCF_OK
@@ -141,7 +142,7 @@ public:
     NCFRESULT ParseHeaders(const ncfUInt8* begin, const ncfUInt8* end,
                            ncfUInt64 position) override {
         enter("ParseHeaders");
-        fed.push_back({position, std::vector<ncfUInt8>(begin, end)});
+        fed.push_back({position, std::vector<ncfUInt8>(begin, end), begin});
         const std::size_t pass = fed.size() - 1;
         return pass < script.size() ? script[pass].result : NCF_OK;
     }

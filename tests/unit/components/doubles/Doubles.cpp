@@ -12,7 +12,9 @@ DescriptionDouble descriptionDouble;
 
 struct NMAVolume::State {};
 
-NMAVolume::NMAVolume(INCFString*) : state_(nullptr) {}
+NMAVolume::NMAVolume(INCFString* path) : state_(nullptr) {
+    volumeDouble.paths.push_back(TextOf(path));
+}
 NMAVolume::~NMAVolume() {
     delete state_;
 }

@@ -41,6 +41,13 @@ TEST_F(Scans, LookForMoviesAlone) {
     EXPECT_EQ(volumeDouble.patterns, std::vector<std::string>(3, "*.mov"));
 }
 
+TEST_F(Scans, GoOverTheEmptyPathWhereNoneWasSet) {
+    const auto format = make<NMA::IMediaFormat>(NMA::Impl::CreateQuickTimeMediaFormat);
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    ASSERT_EQ(format->GetAAFClips(clips.outArg()), NCF_OK);
+    EXPECT_EQ(volumeDouble.paths, std::vector<std::string>{""});
+}
+
 TEST_F(Scans, AnswerNoWhenAResultIsThrown) {
     volumeDouble.throws = true;
     EXPECT_EQ(volume->IsMediaVolume(text("\\a").inArg()), 0);
