@@ -11,7 +11,7 @@
 #include <optional>
 #include <set>
 
-#include "reference_host/header_parser/QTParser.h"
+#include "reference_host/header_parser/InspectHeaders.h"
 #include "reference_host/quicktime/OpenProblem.h"
 
 namespace cliphost {
@@ -79,19 +79,6 @@ TopLevel ReadTopLevel(std::ifstream& stream, std::uint64_t size) {
     return top;
 }
 
-// The header parser's own reason.
-std::string HeaderProblem(std::ifstream& stream) {
-    const auto parser = host::MakeRef<header_parser::QTParser>();
-    const auto readAt = [&stream](ncfUInt64 position, ncfUInt8* to, ncfUInt32 wanted) {
-        stream.clear();
-        stream.seekg(static_cast<std::streamoff>(position));
-        stream.read(reinterpret_cast<char*>(to), wanted);
-        return static_cast<ncfUInt32>(stream.gcount());
-    };
-    return header_parser::ReadHeaders(*parser, readAt) < 0 ? parser->Refusal().reason
-                                                           : "it names no picture and no sound";
-}
-
 }  // namespace
 
 Problem DiagnoseMovie(const std::filesystem::path& movie) {
@@ -151,7 +138,7 @@ Problem DiagnoseMovie(const std::filesystem::path& movie) {
     }
     return because(
         fmt::format("the movie header can't be used: {}; nor can it be read another way: {}",
-                    HeaderProblem(stream), opening),
+                    header_parser::InspectHeaders(movie).refusal.Sentence(), opening),
         {});
 }
 

@@ -2,15 +2,22 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <string>
+
 #include "reference_host/header_parser/ByteReader.h"
 
 namespace header_parser {
+
+// A type for people, in quotes: what is no plain letter is given as its number.
+std::string NameOf(ncfUInt32 type);
+std::string PlainNameOf(ncfUInt32 type);  // without the quotes
 
 // An atom within the header: its type and the bytes behind its own header.
 struct Atom {
     ncfUInt32 type = 0;
     const ncfUInt8* begin = nullptr;
     const ncfUInt8* end = nullptr;
+    const ncfUInt8* start = nullptr;  // of its own header; null for a part of another
 
     ncfUInt64 Size() const { return static_cast<ncfUInt64>(end - begin); }
     explicit operator bool() const { return begin != nullptr; }
@@ -32,12 +39,22 @@ public:
     // Stopped at a zero where an atom could have stood.
     bool Closed() const { return closed_; }
 
+    // Where it stopped early, and what stood there.
+    const ncfUInt8* StoppedAt() const { return stoppedAt_; }
+    ncfUInt64 BytesLeft() const { return left_; }
+    ncfUInt32 StoppedType() const { return stoppedType_; }
+    ncfUInt64 ClaimedSize() const { return claimed_; }
+
 private:
     bool Stop(bool broken);
 
     ByteReader reader_;
     bool broken_ = false;
     bool closed_ = false;
+    const ncfUInt8* stoppedAt_ = nullptr;
+    ncfUInt64 left_ = 0;
+    ncfUInt32 stoppedType_ = 0;
+    ncfUInt64 claimed_ = 0;
 };
 
 // The first child of that type, or an empty atom.

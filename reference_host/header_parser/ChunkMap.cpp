@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/ChunkMap.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <limits>
 
@@ -37,12 +39,12 @@ Verdict ChunkMap::Read(const Atom& stsc, const Atom& stco, const Atom& co64,
     if (!verdict.Refused()) {
         verdict = ReadRuns(stsc, static_cast<ncfUInt32>(isInFile.size()));
     }
-    return verdict.Refused() ? verdict : WalkChunks(sizes, isInFile);
+    return verdict.Refused() ? verdict : WalkChunks(isLarge_ ? co64 : stco, sizes, isInFile);
 }
 
 Verdict ChunkMap::OpenPositions(const Atom& stco, const Atom& co64) {
     if (!stco && !co64) {
-        return Broken("the track has no chunk offsets");
+        return Broken("it lacks 'stco', the places of its chunks");
     }
     isLarge_ = !stco;
     const Atom& atom = isLarge_ ? co64 : stco;
@@ -50,10 +52,16 @@ Verdict ChunkMap::OpenPositions(const Atom& stco, const Atom& co64) {
     reader.Skip(4);
     chunkCount_ = reader.U32();
     positions_ = reader.At();
-    if (reader.Failed() || chunkCount_ > reader.Left() / (isLarge_ ? 8 : 4)) {
-        return Broken("the chunk offset table claims more entries than it holds");
+    if (reader.Failed()) {
+        return CutShort(atom);
     }
-    return chunkCount_ > 0 ? Fine() : Broken("the track has samples but no chunks");
+    if (chunkCount_ > reader.Left() / (isLarge_ ? 8 : 4)) {
+        return ClaimsTooMany(atom, chunkCount_, reader.Left());
+    }
+    return chunkCount_ > 0
+               ? Fine()
+               : Broken(atom, fmt::format("{} holds no chunk, the track has {}", NameOf(atom.type),
+                                          Counted(sampleCount_, "sample")));
 }
 
 Verdict ChunkMap::ReadRuns(const Atom& stsc, ncfUInt32 descriptions) {
@@ -61,11 +69,21 @@ Verdict ChunkMap::ReadRuns(const Atom& stsc, ncfUInt32 descriptions) {
     reader.Skip(4);
     runCount_ = reader.U32();
     runs_ = reader.At();
-    if (reader.Failed() || runCount_ == 0 || runCount_ > reader.Left() / 12) {
-        return Broken("stsc claims more entries than it holds");
+    if (!stsc) {
+        return Broken("it lacks 'stsc', the samples of its chunks");
+    }
+    if (reader.Failed()) {
+        return CutShort(stsc);
+    }
+    if (runCount_ == 0) {
+        return Broken(stsc, fmt::format("'stsc' is empty, the track has {}",
+                                        Counted(sampleCount_, "sample")));
+    }
+    if (runCount_ > reader.Left() / 12) {
+        return ClaimsTooMany(stsc, runCount_, reader.Left());
     }
     if (Field(0, 0) != 1) {
-        return Broken("stsc does not begin with the first chunk");
+        return Broken(stsc, fmt::format("'stsc' begins with chunk {}, not with 1", Field(0, 0)));
     }
     marks_.reserve(runCount_ / kStep + 1);
     ncfUInt64 sample = 0;
@@ -73,26 +91,46 @@ Verdict ChunkMap::ReadRuns(const Atom& stsc, ncfUInt32 descriptions) {
         if (run % kStep == 0) {
             marks_.push_back(static_cast<ncfUInt32>(sample));
         }
-        if (FirstChunk(run) >= EndChunk(run) || EndChunk(run) > chunkCount_) {
-            return Broken("stsc names chunks that the movie lacks");
+        const bool isLast = run + 1 == runCount_;
+        const ncfUInt32 next = isLast ? run : run + 1;
+        if (FirstChunk(next) >= chunkCount_) {
+            return Broken(stsc,
+                          fmt::format("entry {} of 'stsc' begins with chunk {}, the track has {}",
+                                      next + 1, Field(next, 0), chunkCount_));
         }
-        if (SamplesPerChunk(run) == 0 || Description(run) == 0 || Description(run) > descriptions) {
-            return Broken("stsc holds an impossible entry");
+        if (FirstChunk(run) >= EndChunk(run)) {
+            return Broken(stsc,
+                          fmt::format("entry {} of 'stsc' begins with chunk {}, entry {} with {}",
+                                      run + 1, Field(run, 0), next + 1, Field(next, 0)));
+        }
+        if (SamplesPerChunk(run) == 0) {
+            return Broken(stsc,
+                          fmt::format("entry {} of 'stsc' puts no sample in a chunk", run + 1));
+        }
+        if (Description(run) == 0 || Description(run) > descriptions) {
+            return Broken(stsc, fmt::format("entry {} of 'stsc' names sample description {}, the "
+                                            "track has {}",
+                                            run + 1, Description(run), descriptions));
         }
         // The last chunk may be filled in part.
         const ncfUInt64 chunks = EndChunk(run) - FirstChunk(run);
-        const bool isLast = run + 1 == runCount_;
         const ncfUInt64 needed =
             sample + (chunks - (isLast ? 1 : 0)) * SamplesPerChunk(run) + (isLast ? 1 : 0);
         if (needed > sampleCount_) {
-            return Broken("stsc places more samples than there are");
+            return Broken(stsc, fmt::format("'stsc' places {} or more samples, the track has {}",
+                                            needed, sampleCount_));
         }
         sample += chunks * SamplesPerChunk(run);
     }
-    return sample >= sampleCount_ ? Fine() : Broken("stsc places fewer samples than there are");
+    return sample >= sampleCount_
+               ? Fine()
+               : Broken(stsc, fmt::format("'stsc' places {} in {}, the track has {}",
+                                          Counted(sample, "sample"), Counted(chunkCount_, "chunk"),
+                                          sampleCount_));
 }
 
-Verdict ChunkMap::WalkChunks(const SampleSizes& sizes, const std::vector<bool>& isInFile) {
+Verdict ChunkMap::WalkChunks(const Atom& offsets, const SampleSizes& sizes,
+                             const std::vector<bool>& isInFile) {
     breaks_.assign(chunkCount_ / 64 + 1, 0);
     ncfUInt32 sample = 0;
     ncfUInt64 end = 0;
@@ -104,12 +142,16 @@ Verdict ChunkMap::WalkChunks(const SampleSizes& sizes, const std::vector<bool>& 
             const ncfUInt64 position = PositionOf(chunk);
             const ncfUInt64 size = sizes.BytesOf(sample, count);
             if (position > kMaxPosition || size > kMaxPosition - position) {
-                return Broken("a chunk lies beyond any file");
+                return Broken(offsets, fmt::format("chunk {} begins at byte {}, beyond any file",
+                                                   chunk + 1, position));
             }
             // No media can stand where the first atom has its header; this is
             // also what a table looks like behind the end of a cut file.
             if (position < 8 && size > 0 && isInFile[description - 1]) {
-                return Broken("a chunk has no place in the file");
+                return Broken(offsets,
+                              fmt::format("chunk {} begins at byte {}, where the first atom "
+                                          "has its header",
+                                          chunk + 1, position));
             }
             if (position != end || description != lastDescription) {
                 breaks_[chunk / 64] |= ncfUInt64{1} << chunk % 64;

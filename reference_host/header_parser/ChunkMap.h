@@ -46,7 +46,8 @@ public:
 private:
     Verdict OpenPositions(const Atom& stco, const Atom& co64);
     Verdict ReadRuns(const Atom& stsc, ncfUInt32 descriptions);
-    Verdict WalkChunks(const SampleSizes& sizes, const std::vector<bool>& isInFile);
+    Verdict WalkChunks(const Atom& offsets, const SampleSizes& sizes,
+                       const std::vector<bool>& isInFile);
 
     ncfUInt32 FirstChunk(ncfUInt32 run) const { return Field(run, 0) - 1; }
     ncfUInt32 SamplesPerChunk(ncfUInt32 run) const { return Field(run, 4); }

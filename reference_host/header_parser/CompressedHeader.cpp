@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include <fmt/format.h>
 #include <zlib.h>
 
 #include <algorithm>
@@ -50,20 +51,24 @@ Verdict Unpack(const ncfUInt8* from, ncfUInt64 count, ncfUInt64 limit, HeaderByt
         const int result = inflate(&inflater.stream, Z_NO_FLUSH);
         plain.Extend(piece - inflater.stream.avail_out);
         if (plain.Size() > limit) {
-            return TooMuch("the compressed movie header grows too large");
+            return TooMuch(
+                fmt::format("the compressed movie header unpacks to more than {} bytes", limit));
         }
         if (result == Z_STREAM_END) {
             return Fine();
         }
         if (result != Z_OK) {
-            return Broken("the compressed movie header cannot be unpacked");
+            return Broken(
+                fmt::format("the compressed movie header can't be unpacked behind byte {} "
+                            "of {}",
+                            count - inflater.stream.avail_in, count));
         }
     }
 }
 
 }  // namespace
 
-Verdict Inflate(HeaderBytes& bytes, const ParserLimits& limits) {
+Verdict Inflate(HeaderBytes& bytes, const ParserLimits& limits, bool* isUnpacked) {
     const Atom cmov = FindAtom(bytes.begin(), bytes.end(), Code("cmov"));
     if (!cmov) {
         return Fine();
@@ -71,30 +76,39 @@ Verdict Inflate(HeaderBytes& bytes, const ParserLimits& limits) {
     const Atom dcom = FindAtom(cmov.begin, cmov.end, Code("dcom"));
     const Atom cmvd = FindAtom(cmov.begin, cmov.end, Code("cmvd"));
     if (dcom.Size() < 4 || cmvd.Size() < 4) {
-        return Broken("the compressed movie header lacks its parts");
+        return Broken(cmov, dcom.Size() < 4 ? "'cmov' has no 'dcom' that names its compression"
+                                            : "'cmov' has no 'cmvd' with packed bytes");
     }
     if (LoadU32(dcom.begin) != Code("zlib")) {
-        return NotSupported("the movie header is compressed in an unknown way");
+        return NotSupported(dcom,
+                            fmt::format("the movie header is compressed by {}, only 'zlib' is "
+                                        "known",
+                                        NameOf(LoadU32(dcom.begin))));
     }
     const ncfUInt64 limit =
         std::min(cmvd.Size() * limits.maxInflationRatio, limits.maxInflatedBytes);
     HeaderBytes plain;
     Verdict verdict = Unpack(cmvd.begin + 4, cmvd.Size() - 4, limit, plain);
     if (verdict.Refused()) {
+        verdict.at = cmvd.start;
         return verdict;
     }
     if (plain.Size() != LoadU32(cmvd.begin)) {
-        return Broken("the compressed movie header has another size than it says");
+        return Broken(cmvd, fmt::format("'cmvd' says that it unpacks to {} bytes, it unpacks to {}",
+                                        LoadU32(cmvd.begin), plain.Size()));
     }
     const Atom moov = FindAtom(plain.begin(), plain.end(), Code("moov"));
     if (!moov) {
-        return Broken("the compressed movie header holds no movie header");
+        return Broken(cmvd, "what 'cmvd' unpacks to holds no 'moov'");
     }
     HeaderBytes inner;
     if (!inner.Append(moov.begin, moov.Size())) {
         return TooMuch("no memory for the compressed movie header");
     }
     bytes = std::move(inner);
+    if (isUnpacked != nullptr) {
+        *isUnpacked = true;
+    }
     return Fine();
 }
 

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/EditList.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <limits>
 
@@ -38,14 +40,18 @@ Verdict EditList::Read(const Atom& elst, const ParserLimits& limits) {
     const unsigned version = reader.U8();
     reader.Skip(3);
     const ncfUInt32 count = reader.U32();
-    if (reader.Failed() || version > 1) {
-        return Broken("elst is cut short or of an unknown version");
+    if (version > 1) {
+        return OfUnknownVersion(elst, version);
+    }
+    if (reader.Failed()) {
+        return CutShort(elst);
     }
     if (count > reader.Left() / (version == 1 ? 20 : 12)) {
-        return Broken("elst claims more entries than it holds");
+        return ClaimsTooMany(elst, count, reader.Left());
     }
     if (count > limits.maxEditsInTrack) {
-        return TooMuch("too many edits in a track");
+        return TooMuch(elst, fmt::format("'elst' holds {} edits, at most {} are read", count,
+                                         limits.maxEditsInTrack));
     }
     edits_.reserve(count);
     for (ncfUInt32 i = 0; i < count; ++i) {
@@ -55,10 +61,12 @@ Verdict EditList::Read(const Atom& elst, const ParserLimits& limits) {
         edit.mediaTime = version == 1 ? reader.S64() : reader.S32();
         edit.rate = reader.S32();
         if (edit.mediaTime < -1 || edit.mediaTime > kMaxTime) {
-            return Broken("an edit has an impossible media time");
+            return Broken(elst, fmt::format("edit {} begins at the impossible media time {}", i + 1,
+                                            edit.mediaTime));
         }
         if (edit.duration > static_cast<ncfUInt64>(kMaxTime) - duration_) {
-            return Broken("the durations of elst overflow");
+            return Broken(elst,
+                          fmt::format("edits 1 to {} last longer than {} in sum", i + 1, kMaxTime));
         }
         duration_ += edit.duration;
         edits_.push_back(edit);

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/HeaderScanner.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <iterator>
 #include <limits>
@@ -40,6 +42,20 @@ bool IsText(ncfUInt32 type) {
 bool BelongsToFragments(ncfUInt32 type) {
     return type == Code("moof") || type == Code("styp") || type == Code("sidx") ||
            type == Code("mfra");
+}
+
+Verdict At(ncfUInt64 position, Verdict verdict) {
+    verdict.position = position;
+    return verdict;
+}
+
+Verdict TooLarge(ncfUInt64 size, const ParserLimits& limits) {
+    return TooMuch(fmt::format("the movie header is {} bytes long, at most {} are read", size,
+                               limits.maxHeaderBytes));
+}
+
+Verdict NoMemory(ncfUInt64 size) {
+    return TooMuch(fmt::format("there is no memory for a movie header of {} bytes", size));
 }
 
 }  // namespace
@@ -105,7 +121,7 @@ Verdict HeaderScanner::Walk(Range& range) {
     const ncfUInt32 shortSize = LoadU32(range.at);
     const ncfUInt32 type = LoadU32(range.at + 4);
     if (shortSize == 0 && type == 0) {
-        return NoData("the file ends without a movie header");
+        return At(cursor_, NoData("zeros stand where an atom should, before any movie header"));
     }
     if (shortSize == 1 && range.Left() < 16) {
         return Want(cursor_, limits_.scanReadSize);
@@ -113,30 +129,84 @@ Verdict HeaderScanner::Walk(Range& range) {
     const ncfUInt64 headerSize = shortSize == 1 ? 16 : 8;
     const ncfUInt64 size = shortSize == 1 ? LoadU64(range.at + 8) : shortSize;
     if (atomsSeen_ == 0 ? !MayOpenAFile(type) && !BelongsToFragments(type) : !IsText(type)) {
-        return NotSupported("not a file of the QuickTime family");
+        return NoAtomHere(type);
     }
     if (BelongsToFragments(type)) {
-        return NotSupported("the movie is fragmented");
+        return At(cursor_,
+                  NotSupported(fmt::format("the movie is fragmented, as {} tells", NameOf(type))));
     }
     if (++atomsSeen_ > limits_.maxTopLevelAtoms) {
-        return TooMuch("too many atoms in front of the movie header");
+        return At(cursor_, TooMuch(fmt::format("more than {} atoms stand in front of the movie "
+                                               "header",
+                                               limits_.maxTopLevelAtoms)));
     }
     if (shortSize != 0 && (size < headerSize || size > kMaxPosition - cursor_)) {
-        return Broken("an atom's size is impossible");
+        return At(cursor_,
+                  Broken(fmt::format("{} has the impossible size {}", NameOf(type), size)));
     }
     if (type == Code("moov")) {
         range.at += headerSize;
         return EnterHeader(size, headerSize, shortSize == 0);
     }
     if (shortSize == 0) {
-        return NoData("an atom that reaches to the end stands where the movie header should");
+        return At(cursor_,
+                  NoData(fmt::format("{} reaches to the end of the file, before any movie header",
+                                     NameOf(type))));
     }
+    last_ = {type, cursor_, size};
     cursor_ += size;
     if (size >= range.Left()) {
         return Want(cursor_, limits_.scanReadSize);
     }
     range.at += size;
     return Fine();
+}
+
+// Behind other atoms, one of their sizes may have led astray.
+Verdict HeaderScanner::NoAtomHere(ncfUInt32 type) const {
+    if (atomsSeen_ == 0) {
+        return At(
+            0, NotSupported(fmt::format("its first atom would be {}, which opens no movie of the "
+                                        "QuickTime family",
+                                        NameOf(type))));
+    }
+    return At(cursor_,
+              NotSupported(fmt::format("no atom begins where {} ends, which stands at byte {} and "
+                                       "claims {} bytes",
+                                       NameOf(last_.type), last_.position, last_.size)));
+}
+
+Verdict HeaderScanner::Missing(ncfUInt64 fileSize) const {
+    if (state_ != State::kWalk) {
+        return At(atomPosition_,
+                  NoData(state_ == State::kGatherToEnd
+                             ? fmt::format("'moov' reaches to the end of the file at byte {}, amid "
+                                           "an atom",
+                                           fileSize)
+                             : fmt::format("'moov' claims {} bytes, the file ends at byte {}",
+                                           atomSize_, fileSize)));
+    }
+    if (atomsSeen_ == 0) {
+        return At(0,
+                  NoData(fmt::format("the file holds {} and no atom", Counted(fileSize, "byte"))));
+    }
+    if (cursor_ < fileSize) {
+        return At(cursor_,
+                  NoData(fmt::format(
+                      "the file ends at byte {}, amid the head of an atom, before any movie header",
+                      fileSize)));
+    }
+    if (cursor_ > fileSize) {
+        return At(last_.position,
+                  NoData(fmt::format(
+                      "{} claims {} bytes, the file ends at byte {}, before any movie header",
+                      NameOf(last_.type), last_.size, fileSize)));
+    }
+    return At(cursor_, NoData("the file ends without 'moov', the movie header"));
+}
+
+bool HeaderScanner::WalkedToEnd(ncfUInt64 fileSize) const {
+    return state_ == State::kWalk && cursor_ + 8 > fileSize;
 }
 
 Verdict HeaderScanner::EnterHeader(ncfUInt64 size, ncfUInt64 headerSize, bool toEnd) {
@@ -146,7 +216,7 @@ Verdict HeaderScanner::EnterHeader(ncfUInt64 size, ncfUInt64 headerSize, bool to
     cursor_ += headerSize;
     state_ = toEnd ? State::kGatherToEnd : State::kGather;
     if (!toEnd && size > limits_.maxHeaderBytes) {
-        return TooMuch("the movie header is too large");
+        return At(atomPosition_, TooLarge(size, limits_));
     }
     payload_.Expect(toEnd ? 0 : size - headerSize);
     return Fine();
@@ -156,7 +226,7 @@ Verdict HeaderScanner::Gather(Range& range) {
     const ncfUInt64 missing = atomSize_ - atomHeaderSize_ - payload_.Size();
     const ncfUInt64 taken = std::min(missing, range.Left());
     if (!payload_.Append(range.at, taken)) {
-        return TooMuch("no memory for the movie header");
+        return At(atomPosition_, NoMemory(atomSize_));
     }
     range.at += taken;
     cursor_ += taken;
@@ -168,10 +238,10 @@ Verdict HeaderScanner::Gather(Range& range) {
 Verdict HeaderScanner::GatherToEnd(Range& range) {
     const ncfUInt64 taken = range.Left();
     if (payload_.Size() + taken > limits_.maxHeaderBytes) {
-        return TooMuch("the movie header is too large");
+        return At(atomPosition_, TooLarge(payload_.Size() + taken, limits_));
     }
     if (!payload_.Append(range.at, taken)) {
-        return TooMuch("no memory for the movie header");
+        return At(atomPosition_, NoMemory(payload_.Size() + taken));
     }
     range.at += taken;
     cursor_ += taken;
@@ -190,7 +260,9 @@ Verdict HeaderScanner::GatherToEnd(Range& range) {
         }
         childSize = shortSize == 1 ? LoadU64(child + 8) : shortSize;
         if (childSize < 8 || childSize > limits_.maxHeaderBytes) {
-            return Broken("an atom of the movie header has an impossible size");
+            return At(PayloadPosition() + walked_,
+                      Broken(fmt::format("{} in 'moov' has the impossible size {}",
+                                         NameOf(LoadU32(child + 4)), childSize)));
         }
         if (childSize > payload_.Size() - walked_) {
             break;

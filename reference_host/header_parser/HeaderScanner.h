@@ -36,16 +36,29 @@ public:
     ncfUInt64 WantedPosition() const { return wantedPosition_; }
     ncfUInt32 WantedSize() const { return wantedSize_; }
 
+    // What a file that ends at `fileSize` lacks, when the scanner waits for more.
+    Verdict Missing(ncfUInt64 fileSize) const;
+    // Whether it came to that end while it looked for the header.
+    bool WalkedToEnd(ncfUInt64 fileSize) const;
+
     // Of the atom in the file, its header included.
     ncfUInt64 AtomPosition() const { return atomPosition_; }
     ncfUInt64 AtomSize() const { return atomSize_; }
+    ncfUInt64 PayloadPosition() const { return atomPosition_ + atomHeaderSize_; }
     // What stands behind the atom's header; to be taken once.
     HeaderBytes& Payload() { return payload_; }
 
 private:
     enum class State { kWalk, kGather, kGatherToEnd, kConfirm, kWhole };
     struct Range;
+    // An atom of the top level.
+    struct TopAtom {
+        ncfUInt32 type = 0;
+        ncfUInt64 position = 0;
+        ncfUInt64 size = 0;
+    };
 
+    Verdict NoAtomHere(ncfUInt32 type) const;
     Verdict Walk(Range& range);
     Verdict EnterHeader(ncfUInt64 size, ncfUInt64 headerSize, bool toEnd);
     Verdict Gather(Range& range);
@@ -57,6 +70,7 @@ private:
     State state_ = State::kWalk;
     ncfUInt64 cursor_ = 0;  // first byte of the file that is not used up
     ncfUInt32 atomsSeen_ = 0;
+    TopAtom last_;  // the one in front of the cursor
     bool isWaiting_ = false;
     ncfUInt64 wantedPosition_ = 0;
     ncfUInt32 wantedSize_ = 0;

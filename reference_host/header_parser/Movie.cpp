@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/Movie.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <limits>
 
@@ -12,7 +14,7 @@ namespace {
 constexpr ncfUInt64 kMax32 = std::numeric_limits<ncfUInt32>::max();
 
 struct MovieHeader {
-    bool isPresent = false;
+    Atom atom;  // none before it is read
     std::optional<ncfUInt64> duration;
 };
 
@@ -32,17 +34,20 @@ Verdict ReadMovieHeader(const Atom& mvhd, Movie& movie, MovieHeader& header) {
         movie.timeScale = reader.U32();
         duration = reader.U32();
     }
-    if (reader.Failed() || version > 1) {
-        return Broken("mvhd is cut short or of an unknown version");
+    if (version > 1) {
+        return OfUnknownVersion(mvhd, version);
+    }
+    if (reader.Failed()) {
+        return CutShort(mvhd);
     }
     if (movie.timeScale == 0) {
-        return Broken("the movie has no time scale");
+        return Broken(mvhd, "'mvhd' gives a time scale of 0");
     }
     const ncfUInt64 unknown = version == 1 ? std::numeric_limits<ncfUInt64>::max() : kMax32;
     if (duration != 0 && duration != unknown) {
         header.duration = duration;
     }
-    header.isPresent = true;
+    header.atom = mvhd;
     return Fine();
 }
 
@@ -57,28 +62,30 @@ Verdict SortParts(const ParserLimits& limits, Movie& movie, HeaderParts& parts) 
     Atom atom;
     while (atoms.Next(atom)) {
         Verdict verdict;
-        if (atom.type == Code("mvhd") && !parts.header.isPresent) {
+        if (atom.type == Code("mvhd") && !parts.header.atom) {
             verdict = ReadMovieHeader(atom, movie, parts.header);
         } else if (atom.type == Code("trak")) {
             parts.tracks.push_back(atom);
         } else if (atom.type == Code("mvex")) {
-            verdict = NotSupported("the movie is fragmented");
+            verdict = NotSupported(atom, "the movie is fragmented, as 'mvex' tells");
         } else if (atom.type == Code("rmra")) {
-            verdict = NotSupported("the movie only refers to others");
+            verdict = NotSupported(atom, "the movie only refers to other files, by 'rmra'");
         }
         if (verdict.Refused()) {
             return verdict;
         }
         if (parts.tracks.size() > limits.maxTracks) {
-            return TooMuch("too many tracks");
+            return TooMuch(atom,
+                           fmt::format("the movie has more than {} tracks", limits.maxTracks));
         }
     }
     // Zeros among the tracks are what a header looks like behind the end of a
     // cut file.
-    if (atoms.Broken() || atoms.Closed()) {
-        return Broken("the movie header is not a list of atoms");
+    const Verdict verdict = VerdictOn(atoms, "'moov'");
+    if (verdict.Refused()) {
+        return verdict;
     }
-    return parts.header.isPresent ? Fine() : Broken("the movie has no mvhd");
+    return parts.header.atom ? Fine() : Broken("'moov' holds no 'mvhd'");
 }
 
 ncfUInt32 ChannelsOf(const Track& track) {
@@ -91,7 +98,9 @@ ncfUInt32 ChannelsOf(const Track& track) {
 
 Verdict SetDuration(const MovieHeader& header, Movie& movie) {
     if (header.duration && *header.duration > kMax32) {
-        return NotSupported("the movie's duration does not fit 32 bits");
+        return NotSupported(
+            header.atom,
+            fmt::format("the movie's duration of {} units does not fit 32 bits", *header.duration));
     }
     movie.duration = static_cast<ncfUInt32>(header.duration.value_or(0));
     if (!header.duration) {
@@ -113,7 +122,7 @@ bool Movie::IsSelfContained() const {
 
 Verdict ReadMovie(HeaderBytes&& bytes, const ParserLimits& limits, Movie& movie) {
     movie.bytes = std::move(bytes);
-    Verdict verdict = Inflate(movie.bytes, limits);
+    Verdict verdict = Inflate(movie.bytes, limits, &movie.isUnpacked);
     HeaderParts parts;
     if (!verdict.Refused()) {
         verdict = SortParts(limits, movie, parts);

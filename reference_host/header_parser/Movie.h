@@ -46,6 +46,7 @@ struct Track {
 // change any more.
 struct Movie {
     HeaderBytes bytes;
+    bool isUnpacked = false;  // the bytes are not those of the file
     ncfUInt64 creationTime = 0;
     ncfUInt32 timeScale = 0;
     ncfUInt32 duration = 0;
@@ -67,7 +68,7 @@ Verdict ReadMovie(HeaderBytes&& bytes, const ParserLimits& limits, Movie& movie)
 
 // Unpacks a compressed header: `bytes` become those of the plain one. Fine and
 // without effect when the header is plain.
-Verdict Inflate(HeaderBytes& bytes, const ParserLimits& limits);
+Verdict Inflate(HeaderBytes& bytes, const ParserLimits& limits, bool* isUnpacked = nullptr);
 
 // The parts of ReadMovie: a trak atom, and its media.
 Verdict ReadTrack(const Atom& trak, ncfUInt32 movieTimeScale, const ParserLimits& limits,

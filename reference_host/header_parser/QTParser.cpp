@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/QTParser.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 
 #include "reference_host/framework/Guard.h"
@@ -33,23 +35,43 @@ NCFRESULT QTParser::ParseHeaders(const ncfUInt8* begin, const ncfUInt8* end, ncf
         return refusal_.code;
     });
     if (result == NCF_E_OUTOFMEMORY && state_ != State::kRefused) {
-        return Refuse(TooMuch("no memory for the movie header"));
+        return Refuse({NCF_E_OUTOFMEMORY, "there is no memory for the movie header"});
     }
     return result;
 }
 
-NCFRESULT QTParser::Refuse(const Verdict& verdict) {
-    refusal_ = verdict;
+NCFRESULT QTParser::Refuse(Refusal refusal) {
+    refusal_ = std::move(refusal);
     state_ = State::kRefused;
     movie_.reset();
-    return verdict.code;
+    return refusal_.code;
+}
+
+Refusal QTParser::WhyUnfinished(ncfUInt64 fileSize) const {
+    // Zeros stood for what is behind the end of the file.
+    const bool isAtEnd = state_ == State::kRefused && scanner_.WalkedToEnd(fileSize);
+    if (!isWaiting_ && !isAtEnd) {
+        return refusal_;
+    }
+    if (state_ == State::kTimecode) {
+        return {NMA_E_NODATA,
+                fmt::format("the first timecode sample begins at byte {}, the file ends at byte {}",
+                            wantedPosition_, fileSize)};
+    }
+    Refusal missing = Locate(scanner_.Missing(fileSize));
+    missing.code = isAtEnd ? refusal_.code : missing.code;
+    return missing;
+}
+
+std::shared_ptr<const Movie> QTParser::ReadMovie() const {
+    return state_ == State::kDone ? movie_ : nullptr;
 }
 
 NCFRESULT QTParser::ReadHeader(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position) {
     HeaderScanner::Progress progress{};
     Verdict verdict = scanner_.Feed(begin, end, position, progress);
     if (verdict.Refused()) {
-        return Refuse(verdict);
+        return Refuse(Locate(verdict));
     }
     if (progress == HeaderScanner::Progress::kMore) {
         isWaiting_ = true;
@@ -58,9 +80,13 @@ NCFRESULT QTParser::ReadHeader(const ncfUInt8* begin, const ncfUInt8* end, ncfUI
         return QT_E_MOREDATA;
     }
     auto movie = std::make_shared<Movie>();
-    verdict = ReadMovie(std::move(scanner_.Payload()), limits_, *movie);
+    verdict = header_parser::ReadMovie(std::move(scanner_.Payload()), limits_, *movie);
     if (verdict.Refused()) {
-        return Refuse(verdict);
+        const std::optional<ncfUInt64> position = scanner_.PayloadPosition();
+        Refusal refusal =
+            Locate(verdict, movie->bytes, movie->isUnpacked ? std::nullopt : position);
+        refusal.offset = refusal.offset.value_or(scanner_.AtomPosition());
+        return Refuse(std::move(refusal));
     }
     movie->atomPosition = scanner_.AtomPosition();
     movie->atomSize = scanner_.AtomSize();

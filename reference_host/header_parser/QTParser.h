@@ -8,6 +8,7 @@
 #include "reference_host/framework/ComponentFactory.h"
 #include "reference_host/header_parser/HeaderScanner.h"
 #include "reference_host/header_parser/Movie.h"
+#include "reference_host/header_parser/Refusal.h"
 
 namespace header_parser {
 
@@ -42,13 +43,18 @@ public:
     NCFRESULT ReservedParser8() override { return NCF_E_NOTIMPL; }
     NCFRESULT ReservedParser9() override { return NCF_E_NOTIMPL; }
 
-    // Why the file was given up; fine before that.
-    const Verdict& Refusal() const { return refusal_; }
+    // Why the file was given up; nothing before that.
+    const Refusal& WhyRefused() const { return refusal_; }
+    // What a file that ends at `fileSize` lacks for a parser that waits for bytes
+    // which are not there; else why it was given up.
+    Refusal WhyUnfinished(ncfUInt64 fileSize) const;
+    // The whole header, null before it is read.
+    std::shared_ptr<const Movie> ReadMovie() const;
 
 private:
     enum class State { kHeader, kTimecode, kDone, kRefused };
 
-    NCFRESULT Refuse(const Verdict& verdict);
+    NCFRESULT Refuse(Refusal refusal);
     NCFRESULT ReadHeader(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position);
     NCFRESULT ReadTimecode(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position);
     // The first timecode track whose sample can be read, or null.
@@ -62,7 +68,7 @@ private:
     ParserLimits limits_;
     HeaderScanner scanner_;
     State state_ = State::kHeader;
-    Verdict refusal_;
+    Refusal refusal_;
     bool isWaiting_ = false;
     ncfUInt64 wantedPosition_ = 0;
     ncfUInt32 wantedSize_ = 0;

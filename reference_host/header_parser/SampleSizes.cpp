@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/SampleSizes.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <limits>
 
@@ -13,7 +15,7 @@ constexpr ncfUInt32 kStep = 64;  // samples between two marks: 8 bytes for 256 o
 
 Verdict SampleSizes::Read(const Atom& stsz, const Atom& stz2) {
     if (!stsz && !stz2) {
-        return Broken("the track has no sample sizes");
+        return Broken("it lacks 'stsz', the sample sizes");
     }
     const Atom& atom = stsz ? stsz : stz2;
     ByteReader reader(atom.begin, atom.end);
@@ -21,7 +23,7 @@ Verdict SampleSizes::Read(const Atom& stsz, const Atom& stz2) {
     const ncfUInt32 parameter = reader.U32();
     count_ = reader.U32();
     if (reader.Failed()) {
-        return Broken("the sample size table is cut short");
+        return CutShort(atom);
     }
     entries_ = reader.At();
     entryBits_ = 32;
@@ -30,7 +32,8 @@ Verdict SampleSizes::Read(const Atom& stsz, const Atom& stz2) {
     } else {
         entryBits_ = parameter & 0xFF;
         if (entryBits_ != 4 && entryBits_ != 8 && entryBits_ != 16) {
-            return Broken("stz2 has an impossible field size");
+            return Broken(atom, fmt::format("'stz2' gives sizes of {} bits; 4, 8 and 16 are known",
+                                            entryBits_));
         }
     }
     if (fixed_ != 0) {
@@ -38,7 +41,7 @@ Verdict SampleSizes::Read(const Atom& stsz, const Atom& stz2) {
         return Fine();
     }
     if ((ncfUInt64{count_} * entryBits_ + 7) / 8 > reader.Left()) {
-        return Broken("the sample size table claims more entries than it holds");
+        return ClaimsTooMany(atom, count_, reader.Left());
     }
     Mark();
     return Fine();

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/SampleTable.h"
 
+#include <fmt/format.h>
+
 #include "reference_host/header_parser/Marks.h"
 
 namespace header_parser {
@@ -29,7 +31,11 @@ Verdict SampleTable::Read(const SampleTableAtoms& atoms, const PacketLayout& old
     }
     if (!verdict.Refused() && atoms.sdtp) {
         if (atoms.sdtp.Size() < 4 || atoms.sdtp.Size() - 4 < Count()) {
-            return Broken("sdtp has no entry for some samples");
+            return Broken(
+                atoms.sdtp,
+                fmt::format("'sdtp' holds {}, the track has {}",
+                            Counted(atoms.sdtp.Size() < 4 ? 0 : atoms.sdtp.Size() - 4, "entry"),
+                            Counted(Count(), "sample")));
         }
         dependencies_ = atoms.sdtp.begin + 4;
     }
@@ -41,18 +47,24 @@ Verdict SampleTable::NumberList::Read(const Atom& atom, ncfUInt32 sampleCount) {
     reader.Skip(4);
     count = reader.U32();
     numbers = reader.At();
-    if (reader.Failed() || count > reader.Left() / 4) {
-        return Broken("the sync sample table claims more entries than it holds");
+    if (reader.Failed()) {
+        return CutShort(atom);
+    }
+    if (count > reader.Left() / 4) {
+        return ClaimsTooMany(atom, count, reader.Left());
     }
     ncfUInt32 last = 0;
     for (ncfUInt32 i = 0; i < count; ++i) {
         const ncfUInt32 number = reader.U32();
         if (number <= last) {
-            return Broken("the numbers of the sync samples do not rise");
+            return Broken(atom, fmt::format("the numbers in {} do not rise: {} comes after {}",
+                                            NameOf(atom.type), number, last));
         }
         last = number;
     }
-    return last <= sampleCount ? Fine() : Broken("there are sync samples that the track lacks");
+    return last <= sampleCount ? Fine()
+                               : Broken(atom, fmt::format("{} names sample {}, the track has {}",
+                                                          NameOf(atom.type), last, sampleCount));
 }
 
 bool SampleTable::NumberList::Holds(ncfUInt32 number) const {

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/SampleTimes.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <limits>
 
@@ -17,14 +19,22 @@ constexpr ncfUInt32 kStep = 16;
 
 constexpr ncfUInt64 kMaxTime = static_cast<ncfUInt64>(std::numeric_limits<ncfSInt64>::max()) / 2;
 
-// Number of 8-byte entries behind version, flags and count; false when the
-// atom does not hold what it counts.
-bool OpenTable(const Atom& atom, const ncfUInt8*& entries, ncfUInt32& count) {
+// Opens a table of 8-byte entries behind version, flags and count.
+Verdict OpenTable(const Atom& atom, const ncfUInt8*& entries, ncfUInt32& count) {
     ByteReader reader(atom.begin, atom.end);
     reader.Skip(4);
     count = reader.U32();
     entries = reader.At();
-    return !reader.Failed() && count <= reader.Left() / 8;
+    if (reader.Failed()) {
+        return CutShort(atom);
+    }
+    return count <= reader.Left() / 8 ? Fine() : ClaimsTooMany(atom, count, reader.Left());
+}
+
+Verdict CountsOther(const Atom& atom, ncfUInt64 counted, ncfUInt32 sampleCount) {
+    return Broken(atom, fmt::format("{} counts {}{}, the track has {}", NameOf(atom.type),
+                                    Counted(counted, "sample"),
+                                    counted > sampleCount ? " or more" : "", sampleCount));
 }
 
 }  // namespace
@@ -45,8 +55,12 @@ Verdict SampleTimes::Read(const Atom& durations, const Atom& offsets, ncfUInt32 
 }
 
 Verdict SampleTimes::ReadDurations(const Atom& atom) {
-    if (!atom || !OpenTable(atom, durations_, durationEntries_)) {
-        return Broken("stts claims more entries than it holds");
+    if (!atom) {
+        return Broken("it lacks 'stts', the sample durations");
+    }
+    Verdict verdict = OpenTable(atom, durations_, durationEntries_);
+    if (verdict.Refused()) {
+        return verdict;
     }
     durationMarks_.reserve(durationEntries_ / kStep + 1);
     ncfUInt64 sample = 0;
@@ -57,20 +71,22 @@ Verdict SampleTimes::ReadDurations(const Atom& atom) {
         const ncfUInt64 length = ncfUInt64{DurationCount(entry)} * Duration(entry);
         sample += DurationCount(entry);
         if (sample > sampleCount_) {
-            return Broken("stts counts more samples than there are");
+            return CountsOther(atom, sample, sampleCount_);
         }
         if (length > kMaxTime - total_) {
-            return Broken("the durations of stts overflow");
+            return Broken(atom,
+                          fmt::format("the durations in 'stts' come to more than {}", kMaxTime));
         }
         total_ += length;
         hasOneDuration_ = hasOneDuration_ && Duration(entry) == Duration(0);
     }
-    return sample == sampleCount_ ? Fine() : Broken("stts counts fewer samples than there are");
+    return sample == sampleCount_ ? Fine() : CountsOther(atom, sample, sampleCount_);
 }
 
 Verdict SampleTimes::ReadOffsets(const Atom& atom) {
-    if (!OpenTable(atom, offsets_, offsetEntries_)) {
-        return Broken("ctts claims more entries than it holds");
+    Verdict verdict = OpenTable(atom, offsets_, offsetEntries_);
+    if (verdict.Refused()) {
+        return verdict;
     }
     offsetMarks_.reserve(offsetEntries_ / kStep + 1);
     ncfUInt64 sample = 0;
@@ -80,10 +96,10 @@ Verdict SampleTimes::ReadOffsets(const Atom& atom) {
         }
         sample += OffsetCount(entry);
         if (sample > sampleCount_) {
-            return Broken("ctts counts more samples than there are");
+            return CountsOther(atom, sample, sampleCount_);
         }
     }
-    return sample == sampleCount_ ? Fine() : Broken("ctts counts fewer samples than there are");
+    return sample == sampleCount_ ? Fine() : CountsOther(atom, sample, sampleCount_);
 }
 
 // One walk over the runs of both tables. Within a stretch the display times

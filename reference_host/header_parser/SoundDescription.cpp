@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/SoundDescription.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <cmath>
 #include <iterator>
@@ -112,14 +114,16 @@ bool IsMarkedLittleEndian(const ncfUInt8* begin, const ncfUInt8* end) {
 }
 
 // `ipcm` and `fpcm`: the atom `pcmC` behind the fields tells byte order and depth.
-Verdict DescribeIsoLinear(const RawFields& raw, const Atom& pcmC, SoundDescription& description) {
+Verdict DescribeIsoLinear(const Atom& entry, const RawFields& raw, const Atom& pcmC,
+                          SoundDescription& description) {
     constexpr ncfUInt64 kSize = 6;  // version and flags, byte order, depth
     const bool isTold = pcmC.Size() >= kSize;
     const ncfUInt32 bits = isTold ? pcmC.begin[5] : raw.bits;
     const bool isFloat = description.codec == Code("fpcm");
     const bool isPossible = bits == 32 || (isFloat ? bits == 64 : bits == 16 || bits == 24);
     if (raw.channels == 0 || !isPossible) {
-        return Broken("a description of linear sound has impossible values");
+        return Broken(entry, fmt::format("{} has {} channels of {} bits", NameOf(entry.type),
+                                         raw.channels, bits));
     }
     description.bits = bits;
     description.isLinear = true;
@@ -130,8 +134,8 @@ Verdict DescribeIsoLinear(const RawFields& raw, const Atom& pcmC, SoundDescripti
     return Fine();
 }
 
-Verdict DescribeLinear(const LinearCode& code, const RawFields& raw, bool isLittleEndian,
-                       SoundDescription& description) {
+void DescribeLinear(const LinearCode& code, const RawFields& raw, bool isLittleEndian,
+                    SoundDescription& description) {
     description.bits = code.bits;
     if (code.bits == 0) {
         const bool isKnown = raw.bits == 8 || raw.bits == 16 || raw.bits == 24 || raw.bits == 32;
@@ -143,15 +147,11 @@ Verdict DescribeLinear(const LinearCode& code, const RawFields& raw, bool isLitt
     description.isConstantBitRate = true;
     description.framesPerPacket = 1;
     description.bytesPerPacket = description.channels * (description.bits / 8);
-    return raw.channels != 0 ? Fine() : Broken("linear sound has no channels");
 }
 
 // `lpcm` of version 2: the flags tell. What is not interleaved or does not
 // fill its bytes is constant, but no plain linear sound.
-Verdict DescribeByFlags(const RawFields& raw, SoundDescription& description) {
-    if (raw.channels == 0 || raw.bits == 0 || raw.bits > 64) {
-        return Broken("a description of linear sound has impossible values");
-    }
+void DescribeByFlags(const RawFields& raw, SoundDescription& description) {
     const ncfUInt32 frameBytes = raw.channels * ((raw.bits + 7) / 8);
     description.bits = raw.bits;
     description.isLittleEndian = (raw.linearFlags & kFlagBigEndian) == 0;
@@ -161,7 +161,6 @@ Verdict DescribeByFlags(const RawFields& raw, SoundDescription& description) {
     description.isLinear = description.bytesPerPacket == frameBytes &&
                            description.framesPerPacket == 1 &&
                            (raw.linearFlags & kFlagNonInterleaved) == 0;
-    return Fine();
 }
 
 void DescribeCompressed(const RawFields& raw, SoundDescription& description) {
@@ -182,27 +181,40 @@ Verdict ReadSoundDescription(const Atom& entry, bool isIso, ncfUInt32 mediaTimeS
                              SoundDescription& description) {
     ByteReader reader(entry.begin, entry.end);
     const RawFields raw = ReadFields(reader, isIso);
-    if (reader.Failed() || raw.version > 2) {
-        return Broken("a sound description is cut short or of an unknown version");
+    if (raw.version > 2) {
+        return OfUnknownVersion(entry, raw.version);
+    }
+    if (reader.Failed()) {
+        return CutShort(entry);
     }
     if (raw.channels > kMaxChannels) {
-        return Broken("a sound description has too many channels");
+        return Broken(entry, fmt::format("{} has {} channels, at most {} are read",
+                                         NameOf(entry.type), raw.channels, kMaxChannels));
     }
     description.codec = entry.type;
     description.channels = raw.channels;
     description.rate = raw.rate == 0.0 ? mediaTimeScale : raw.rate;
     if (!std::isfinite(description.rate) || description.rate < 1.0 || description.rate > 1e9) {
-        return Broken("a sound description has an impossible rate");
+        return Broken(entry, fmt::format("{} has the impossible rate {}", NameOf(entry.type),
+                                         description.rate));
     }
     if (entry.type == Code("lpcm") && raw.version == 2) {
-        return DescribeByFlags(raw, description);
+        if (raw.channels == 0 || raw.bits == 0 || raw.bits > 64) {
+            return Broken(entry,
+                          fmt::format("'lpcm' has {} channels of {} bits", raw.channels, raw.bits));
+        }
+        DescribeByFlags(raw, description);
+        return Fine();
     }
     if (const LinearCode* code = Find(kLinearCodes, entry.type)) {
-        return DescribeLinear(*code, raw, IsMarkedLittleEndian(reader.At(), reader.End()),
-                              description);
+        if (raw.channels == 0) {
+            return Broken(entry, fmt::format("{} has no channels", NameOf(entry.type)));
+        }
+        DescribeLinear(*code, raw, IsMarkedLittleEndian(reader.At(), reader.End()), description);
+        return Fine();
     }
     if (entry.type == Code("ipcm") || entry.type == Code("fpcm")) {
-        return DescribeIsoLinear(raw, FindAtom(reader.At(), reader.End(), Code("pcmC")),
+        return DescribeIsoLinear(entry, raw, FindAtom(reader.At(), reader.End(), Code("pcmC")),
                                  description);
     }
     ReadSoundConfig(entry.type, reader.At(), reader.End(), description);

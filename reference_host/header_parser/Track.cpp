@@ -1,5 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <limits>
 
@@ -40,7 +42,7 @@ Verdict SortChildren(const Atom& parent, std::initializer_list<Slot> slots) {
             }
         }
     }
-    return atoms.Broken() || atoms.Closed() ? Broken("a track is not a list of atoms") : Fine();
+    return VerdictOn(atoms, NameOf(parent.type));
 }
 
 Verdict SortMediaInformation(const Atom& minf, TrackAtoms& atoms) {
@@ -54,7 +56,7 @@ Verdict SortMediaInformation(const Atom& minf, TrackAtoms& atoms) {
         verdict = SortChildren(dinf, {{Code("dref"), &atoms.dref}});
     }
     if (!verdict.Refused() && !stbl) {
-        verdict = Broken("a track has no sample table");
+        verdict = Broken(minf, "it lacks 'stbl', the sample table");
     }
     if (verdict.Refused()) {
         return verdict;
@@ -88,7 +90,8 @@ Verdict SortTrack(const Atom& trak, TrackAtoms& atoms) {
             {{Code("mdhd"), &atoms.mdhd}, {Code("hdlr"), &atoms.hdlr}, {Code("minf"), &minf}});
     }
     if (!verdict.Refused() && !minf) {
-        verdict = Broken("a track has no media information");
+        verdict = mdia ? Broken(mdia, "it lacks 'minf', the media information")
+                       : Broken(trak, "it lacks 'mdia', the media");
     }
     return verdict.Refused() ? verdict : SortMediaInformation(minf, atoms);
 }
@@ -97,6 +100,17 @@ Verdict SortTrack(const Atom& trak, TrackAtoms& atoms) {
 std::optional<ncfUInt64> KnownDuration(ncfUInt64 duration, unsigned version) {
     const ncfUInt64 unknown = version == 1 ? std::numeric_limits<ncfUInt64>::max() : kMax32;
     return duration == 0 || duration == unknown ? std::nullopt : std::optional(duration);
+}
+
+Verdict VerdictOnHeader(const Atom& header, const char* what, unsigned version,
+                        const ByteReader& reader) {
+    if (!header) {
+        return Broken(std::string("it lacks ") + what);
+    }
+    if (version > 1) {
+        return OfUnknownVersion(header, version);
+    }
+    return reader.Failed() ? CutShort(header) : Fine();
 }
 
 Verdict ReadTrackHeader(const Atom& tkhd, Track& track, std::optional<ncfUInt64>& duration) {
@@ -111,10 +125,11 @@ Verdict ReadTrackHeader(const Atom& tkhd, Track& track, std::optional<ncfUInt64>
         const float unit = i % 3 == 2 ? 1073741824.0f : 65536.0f;
         track.matrix[i] = static_cast<float>(reader.S32()) / unit;
     }
-    if (reader.Failed() || version > 1) {
-        return Broken("tkhd is missing, cut short or of an unknown version");
+    const Verdict verdict = VerdictOnHeader(tkhd, "'tkhd', the track header", version, reader);
+    if (verdict.Refused()) {
+        return verdict;
     }
-    return track.id != 0 ? Fine() : Broken("a track has no number");
+    return track.id != 0 ? Fine() : Broken(tkhd, "'tkhd' gives it the number 0");
 }
 
 Verdict ReadMediaHeader(const Atom& mdhd, Track& track, std::optional<ncfUInt64>& duration) {
@@ -123,10 +138,11 @@ Verdict ReadMediaHeader(const Atom& mdhd, Track& track, std::optional<ncfUInt64>
     reader.Skip(3u + (version == 1 ? 16 : 8));
     track.mediaTimeScale = reader.U32();
     duration = KnownDuration(version == 1 ? reader.U64() : reader.U32(), version);
-    if (reader.Failed() || version > 1) {
-        return Broken("mdhd is missing, cut short or of an unknown version");
+    const Verdict verdict = VerdictOnHeader(mdhd, "'mdhd', the media header", version, reader);
+    if (verdict.Refused()) {
+        return verdict;
     }
-    return track.mediaTimeScale != 0 ? Fine() : Broken("a track's media has no time scale");
+    return track.mediaTimeScale != 0 ? Fine() : Broken(mdhd, "'mdhd' gives a time scale of 0");
 }
 
 // By the handler; a very old file may have none, then by the media header.
@@ -141,13 +157,21 @@ TrackKind KindOf(const TrackAtoms& atoms) {
     return handler == Code("tmcd") ? TrackKind::kTimecode : TrackKind::kOther;
 }
 
+Verdict HoldsFewer(const Atom& table, ncfUInt32 claimed, std::size_t held) {
+    return Broken(table, fmt::format("{} claims {} and holds {}", NameOf(table.type),
+                                     Counted(claimed, "entry"), held));
+}
+
 // Which data references are this file itself. Without a table all are.
 Verdict ReadDataReferences(const Atom& dref, std::vector<bool>& isInFile) {
     ByteReader reader(dref.begin, dref.end);
     reader.Skip(4);
     const ncfUInt32 count = reader.U32();
-    if (reader.Failed() || count > reader.Left() / 8) {
-        return Broken("dref claims more entries than it holds");
+    if (reader.Failed()) {
+        return CutShort(dref);
+    }
+    if (count > reader.Left() / 8) {
+        return ClaimsTooMany(dref, count, reader.Left());
     }
     AtomList entries(reader.At(), reader.End());
     Atom entry;
@@ -155,7 +179,7 @@ Verdict ReadDataReferences(const Atom& dref, std::vector<bool>& isInFile) {
         const ncfUInt32 flags = entry.Size() >= 4 ? LoadU32(entry.begin) : 0;
         isInFile.push_back((flags & 1) != 0);
     }
-    return isInFile.size() == count ? Fine() : Broken("dref holds fewer entries than it claims");
+    return isInFile.size() == count ? Fine() : HoldsFewer(dref, count, isInFile.size());
 }
 
 Verdict ReadDescription(const Atom& entry, bool isIso, const ParserLimits& limits, Track& track) {
@@ -183,17 +207,24 @@ Verdict ReadDescriptions(const Atom& stsd, const std::vector<bool>& references, 
     const bool isIso = reader.U8() != 0;
     reader.Skip(3);
     const ncfUInt32 count = reader.U32();
-    if (reader.Failed() || count > reader.Left() / 16) {
-        return Broken("stsd claims more entries than it holds");
+    if (!stsd) {
+        return Broken("it lacks 'stsd', the sample descriptions");
+    }
+    if (reader.Failed()) {
+        return CutShort(stsd);
+    }
+    if (count > reader.Left() / 16) {
+        return ClaimsTooMany(stsd, count, reader.Left());
     }
     if (count > limits.maxDescriptionsInTrack) {
-        return TooMuch("too many sample descriptions in a track");
+        return TooMuch(stsd, fmt::format("'stsd' holds {} sample descriptions, at most {} are read",
+                                         count, limits.maxDescriptionsInTrack));
     }
     AtomList entries(reader.At(), reader.End());
     Atom entry;
     while (track.isInFile.size() < count && entries.Next(entry)) {
         if (entry.Size() < 8) {
-            return Broken("a sample description is cut short");
+            return CutShort(entry);
         }
         const Verdict verdict = ReadDescription(entry, isIso, limits, track);
         if (verdict.Refused()) {
@@ -204,13 +235,13 @@ Verdict ReadDescriptions(const Atom& stsd, const std::vector<bool>& references, 
         // Some recorders name no reference where they mean their own file, and
         // some descriptions of other data do not even have the field.
         if (hasReferences && !isListed && reference != 0 && track.kind != TrackKind::kOther) {
-            return Broken("a sample description has no data reference");
+            return Broken(entry, fmt::format("{} names data reference {}, 'dref' has {}",
+                                             NameOf(entry.type), reference, references.size()));
         }
         track.isInFile.push_back(!isListed || references[reference - 1]);
     }
     track.descriptionCount = count;
-    return track.isInFile.size() == count ? Fine()
-                                          : Broken("stsd holds fewer entries than it claims");
+    return track.isInFile.size() == count ? Fine() : HoldsFewer(stsd, count, track.isInFile.size());
 }
 
 // Whether the track plays its media whole by what the headers of both say, to
@@ -253,7 +284,8 @@ Verdict SetDurations(std::optional<ncfUInt64> header, std::optional<ncfUInt64> m
     const ncfUInt64 duration =
         told.value_or(MultiplyDivide(mediaDuration, movieTimeScale, track.mediaTimeScale));
     if (media.value_or(0) > kMax32 || mediaDuration > kMax32 || duration > kMax32) {
-        return NotSupported("a track's duration does not fit 32 bits");
+        return NotSupported(fmt::format("its duration of {} units does not fit 32 bits",
+                                        std::max({media.value_or(0), mediaDuration, duration})));
     }
     track.mediaDuration = static_cast<ncfUInt32>(mediaDuration);
     track.duration = static_cast<ncfUInt32>(duration);
@@ -291,8 +323,14 @@ Verdict ReadTrack(const Atom& trak, ncfUInt32 movieTimeScale, const ParserLimits
             track.sound.empty() ? PacketLayout() : track.sound.front().OldLayout();
         verdict = track.samples.Read(atoms.tables, oldSound, track.isInFile);
     }
-    return verdict.Refused() ? verdict
-                             : SetDurations(headerDuration, mediaDuration, movieTimeScale, track);
+    if (!verdict.Refused()) {
+        verdict = SetDurations(headerDuration, mediaDuration, movieTimeScale, track);
+    }
+    // What is missing is missing in the track.
+    if (verdict.Refused() && verdict.at == nullptr) {
+        verdict.at = trak.start;
+    }
+    return verdict;
 }
 
 }  // namespace header_parser

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/VideoDescription.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <iterator>
 
@@ -133,7 +135,7 @@ Verdict ReadVideoDescription(const Atom& entry, const ParserLimits& limits,
     description.depth = reader.U16();
     const unsigned colorTable = reader.U16();
     if (reader.Failed()) {
-        return Broken("a video description is cut short");
+        return CutShort(entry);
     }
     description.hasAlpha =
         description.depth == 32 || std::find(std::begin(kAlphaCodes), std::end(kAlphaCodes),
@@ -156,7 +158,8 @@ Verdict ReadVideoDescription(const Atom& entry, const ParserLimits& limits,
     }
     if (description.rasterText.Size() > limits.maxAttributeText ||
         description.colorText.Size() > limits.maxAttributeText) {
-        return TooMuch("an attribute text is too long");
+        return TooMuch(entry, fmt::format("an attribute text of {} has more than {} bytes",
+                                          NameOf(entry.type), limits.maxAttributeText));
     }
     return Fine();
 }

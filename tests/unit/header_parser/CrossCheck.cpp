@@ -302,7 +302,7 @@ void CompareFile(const std::filesystem::path& path) {
         &passes);
     if (result != NCF_OK) {
         std::printf("%s: refused after %u passes with %08x: %s\n", file.c_str(), passes,
-                    static_cast<unsigned>(result), parser->Refusal().reason);
+                    static_cast<unsigned>(result), parser->WhyRefused().Sentence().c_str());
         return;
     }
     const json probe = Probe(path.string());

@@ -114,18 +114,13 @@ TEST_P(WholeMovieTest, IsTakenOrRefusedWithRandomDamage) {
 }
 
 TEST(MissingAtom, IsNamedByTheReason) {
-    const std::pair<const char*, const char*> kAtoms[] = {
-        {"tkhd", "tkhd is missing"},   {"mdia", "media information"}, {"mdhd", "mdhd is missing"},
-        {"minf", "media information"}, {"stbl", "no sample table"},   {"stsz", "no sample sizes"},
-        {"stco", "no chunk offsets"},
-    };
-    for (const auto& [atom, reason] : kAtoms) {
+    for (const char* const atom : {"tkhd", "mdia", "mdhd", "minf", "stbl", "stsz", "stco"}) {
         movies::Movie movie = PlainMovie();
         movie.tracks[0].omitted = {atom};
         const ParsedMovie parsed(movie);
         EXPECT_LT(parsed.Result(), 0) << atom;
-        EXPECT_NE(parsed.Reason().find(reason), std::string::npos)
-            << "without " << atom << ": " << parsed.Reason();
+        EXPECT_NE(parsed.Reason().find(std::string("it lacks '") + atom + "'"), std::string::npos)
+            << parsed.Reason();
     }
 }
 

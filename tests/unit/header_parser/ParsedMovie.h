@@ -19,7 +19,7 @@ public:
                          const header_parser::ParserLimits& limits = {});
 
     NCFRESULT Result() const { return result_; }
-    std::string Reason() const { return parser_->Refusal().reason; }
+    std::string Reason() const { return parser_->WhyRefused().reason; }
     ncfUInt32 Passes() const { return passes_; }
     header_parser::QTParser* operator->() const { return parser_.get(); }
     header_parser::QTParser& Parser() const { return *parser_; }

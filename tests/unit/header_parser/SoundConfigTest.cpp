@@ -235,8 +235,7 @@ TEST(SoundConfig, OfIsoLinearSoundRefusesDepthsThatItDoesNotHave) {
         movies::Movie movie;
         movie.tracks = {movies::SoundTrack(format, 4800)};
         EXPECT_EQ(ParsedMovie(movie).Reason(),
-                  "a description of linear sound has impossible values")
-            << bits;
+                  "'ipcm' has 2 channels of " + std::to_string(bits) + " bits");
     }
 }
 

@@ -85,7 +85,7 @@ TEST(SoundDescription, TellsTheOldLinearCodesInVersions0And1) {
 TEST(SoundDescription, RefusesMoreChannelsThanAnyRecorderWrites) {
     EXPECT_EQ(Parse(Format("sowt", 16, 0, 1024).ToBox()), Linear(1024, 16, true));
     EXPECT_EQ(ParseMovie(Format("sowt", 16, 0, 1025).ToBox()).Reason(),
-              "a sound description has too many channels");
+              "'sowt' has 1025 channels, at most 1024 are read");
 }
 
 TEST(SoundDescription, TakesACodeOfZeroForTheOldestLinearSound) {
