@@ -8,6 +8,18 @@
 // one object. Tracks are the host's numbers, `trackNMA`: the picture, its alpha
 // if the clip shows one, then the sound tracks, from zero. Samples count from
 // zero too. An operation that refuses answers NCF_E_NOTIMPL.
+//
+// Threads. A mapping locks itself, but all mappings of one clip share the clip's
+// readers, and nothing locks those across mappings. A host must not
+//   - deliver from two mappings of one clip on two threads at once, least of all in
+//     different formats: the reader's format may change between the moment at which
+//     a buffer is sized and the moment at which it is filled, and the frame is then
+//     written past the end of the buffer;
+//   - choose a format, Setup or Cleanup on one mapping of a clip while another
+//     delivers: this stops and starts the reader that both use. After a Cleanup
+//     each of them needs a Setup.
+// Two mappings of one clip take turns under a lock of the host's. A host that wants
+// frames on several threads opens a container on each: containers share nothing.
 namespace NMA {
 
 // Delivers decoded samples in the formats that were chosen before.
