@@ -18,6 +18,15 @@ rule 'system headers belong in source/plugin/os/' \
 rule 'throw typed codes, never literals or raw results' 'throw (0x|-?[0-9]|hr\b|\(?HRESULT)' -- source
 rule 'a long text has no fixed width here' '\b(unsigned )?long [a-z_A-Z]+ *(=|;|,|\))' -- source
 
+rule 'a path in a command needs Quoted()' \
+  '(RunCommand|RunCliphost|popen|system)\(.*\.string\(\)' -- tests
+while read -r file; do
+  if [ "$(grep -c 'add_custom_command(' "$file")" != "$(grep -cw VERBATIM "$file")" ]; then
+    echo "$file: add_custom_command needs VERBATIM, or a parenthesis in a path breaks the build"
+    failed=1
+  fi
+done < <(git grep -l 'add_custom_command(' -- '*CMakeLists.txt' '*.cmake')
+
 mapfile -t files < <(git ls-files '*.h' '*.cpp')
 if ! bad=$(clang-format --dry-run -Werror "${files[@]}" 2>&1); then
   printf '%s\n' "$bad" | grep -E 'error:' | cut -d: -f1 | sort | uniq -c | sort -rn | head -20
