@@ -33,6 +33,14 @@ if(CLIPHOST_FUZZ)
   target_compile_options(project_options INTERFACE -fsanitize=fuzzer-no-link)
 endif()
 
+# define_paths(SOURCE NAME=PATH ...): texts for one source file alone. All other
+# files compile alike wherever the project lies, so a cache of compilations
+# serves every copy of it.
+function(define_paths source)
+  list(TRANSFORM ARGN REPLACE "^([^=]+)=(.*)$" "\\1=\"\\2\"")
+  set_property(SOURCE ${source} APPEND PROPERTY COMPILE_DEFINITIONS ${ARGN})
+endfunction()
+
 # project_library(NAME SOURCES file... [PUBLIC target...] [PRIVATE target...])
 # One static library for one folder, linked into the module, the host or tests.
 function(project_library name)
