@@ -15,6 +15,10 @@ mkdir -p "$folder"
 fail() { printf 'make_test_movies: %s\n' "$*" >&2; exit 1; }
 command -v ffmpeg >/dev/null || fail 'ffmpeg is needed; install the package ffmpeg'
 
+# Two runs at once: the second finds what the first has made.
+exec 9>"$folder/.lock"
+flock 9
+
 stamp=$(cat "$list" "${BASH_SOURCE[0]}" | sha256sum)
 if [ "$(cat "$folder/.made" 2>/dev/null)" != "$stamp" ]; then
   rm -f "$folder"/*.* "$folder/.made"
