@@ -19,6 +19,7 @@
 #include "benchmarks/support/Ratios.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/cliphost/Describe.h"
+#include "tests/support/Quoted.h"
 
 namespace {
 
@@ -88,8 +89,8 @@ void ReadAndHash(benchmark::State& state) {
 }
 
 void Ffprobe(benchmark::State& state) {
-    const std::string command = "ffprobe -v error -show_format -show_streams '" +
-                                FileOf(state.range(0)).Path().string() + "' > /dev/null";
+    const std::string command = "ffprobe -v error -show_format -show_streams " +
+                                Quoted(FileOf(state.range(0)).Path()) + " > /dev/null";
     for (auto _ : state) {
         if (std::system(command.c_str()) != 0) {
             state.SkipWithError("ffprobe failed");

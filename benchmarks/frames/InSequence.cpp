@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "benchmarks/frames/SampleFilm.h"
+#include "tests/support/Quoted.h"
 
 namespace {
 
@@ -51,7 +52,7 @@ void Reader(benchmark::State& state, int depth, ncfUInt32 fourCC) {
 void Ffmpeg(benchmark::State& state, int depth, const char* arguments) {
     const SampleFilm& film = FilmOf(depth);
     const std::string command =
-        "ffmpeg -y -v error -i " + film.Path() + " -f rawvideo " + arguments + " /dev/null";
+        "ffmpeg -y -v error -i " + Quoted(film.Path()) + " -f rawvideo " + arguments + " /dev/null";
     for (auto _ : state) {
         if (!film.Works() || std::system(command.c_str()) != 0) {
             state.SkipWithError("the ffmpeg command failed");

@@ -9,6 +9,7 @@
 
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/quicktime/QuickTimeWrapper.h"
+#include "tests/support/Quoted.h"
 
 SampleFilm::SampleFilm(const std::string& codec, int frames)
     : path_((std::filesystem::temp_directory_path() /
@@ -16,7 +17,7 @@ SampleFilm::SampleFilm(const std::string& codec, int frames)
                 .string()),
       frames_(frames),
       works_(std::system(("ffmpeg -y -v error -f lavfi -i testsrc2=s=1920x1080:r=25 -frames:v " +
-                          std::to_string(frames) + " " + codec + " " + path_)
+                          std::to_string(frames) + " " + codec + " " + Quoted(path_))
                              .c_str()) == 0) {}
 
 SampleFilm::~SampleFilm() {

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "benchmarks/header_parser/LongMovie.h"
 
+#include <unistd.h>
+
 #include <stdexcept>
 
 movies::Movie LongMovie(std::uint64_t samples) {
@@ -32,7 +34,7 @@ movies::Movie LongMovie(std::uint64_t samples) {
 
 LongMovieFile::LongMovieFile(std::uint64_t samples)
     : path_(std::filesystem::temp_directory_path() /
-            ("long_movie_" + std::to_string(samples) + ".mov")) {
+            ("long_movie_" + std::to_string(samples) + "_" + std::to_string(getpid()) + ".mov")) {
     const movies::MadeMovie made = movies::Build(LongMovie(samples));
     headerPosition_ = made.headerPosition;
     headerSize_ = made.headerSize;

@@ -9,7 +9,6 @@
 #include <filesystem>
 #include <fstream>
 #include <ostream>
-#include <random>
 #include <set>
 
 #include "fuzz/support/RunLimits.h"
@@ -23,6 +22,7 @@
 #include "source/descriptor_data/ParseAAFInfoXML.h"
 #include "source/descriptor_data/TextToNumber.h"
 #include "source/plugin/CreationFunctions.h"
+#include "tests/support/TestFolder.h"
 
 namespace {
 
@@ -37,10 +37,10 @@ INCFComponentFactory* Factory() {
     return &host->factory();
 }
 
+// One file for the whole run, gone with it.
 const NMAString& TheFile(const std::uint8_t* data, std::size_t size) {
-    static const std::string path =
-        std::filesystem::temp_directory_path() /
-        ("data_files_fuzz_" + std::to_string(std::random_device{}()) + ".xml");
+    static const TestFolder folder;
+    static const std::filesystem::path path = folder / "data.xml";
     static const NMAString name(path.c_str());
     std::ofstream(path, std::ios::binary)
         .write(reinterpret_cast<const char*>(data), static_cast<std::streamsize>(size));

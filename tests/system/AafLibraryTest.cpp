@@ -38,15 +38,15 @@ TEST_F(AafLibraryOption, TakesAnyFileThatCallsItselfByThePublishedName) {
     const fs::path library = OtherBuild(folder(), true);
     const fs::path saved = folder() / "saved.aaf";
     const fs::path movie = Write(movies::Movie{{movies::VideoTrack({}, 10, 25, 1)}}, "m.mov");
-    const CommandResult run = RunCliphost("--aaf-library '" + library.string() + "' describe '" +
-                                          movie.string() + "' --aaf '" + saved.string() + "'");
+    const CommandResult run = RunCliphost("--aaf-library " + Quoted(library) + " describe " +
+                                          Quoted(movie) + " --aaf " + Quoted(saved));
     EXPECT_EQ(run.status, 0) << run.out;
     EXPECT_TRUE(fs::exists(saved));
 }
 
 TEST_F(AafLibraryOption, RefusesAFileThatTheModuleWouldNotFind) {
     const fs::path library = OtherBuild(folder(), false);
-    const CommandResult run = RunCliphost("--aaf-library '" + library.string() + "' plugin");
+    const CommandResult run = RunCliphost("--aaf-library " + Quoted(library) + " plugin");
     EXPECT_EQ(run.status, 2);
     EXPECT_NE(run.out.find(library.string() + ": the module would not find this AAF library"),
               std::string::npos)
@@ -58,14 +58,14 @@ TEST_F(AafLibraryOption, TakesALibraryWithoutAnInnerNameFromTheSearchPath) {
     const fs::path library = folder() / "libcom-api.so";
     fs::rename(OtherBuild(folder(), false), library);
     setenv("LD_LIBRARY_PATH", folder().c_str(), 1);
-    const CommandResult run = RunCliphost("--aaf-library '" + library.string() + "' plugin");
+    const CommandResult run = RunCliphost("--aaf-library " + Quoted(library) + " plugin");
     unsetenv("LD_LIBRARY_PATH");
     EXPECT_EQ(run.status, 0) << run.out;
 }
 
 TEST_F(AafLibraryOption, RefusesALibraryThatLacksThePublishedFunctions) {
     const fs::path library = ProgramFolder() / "libNMAUtilLib20.so";
-    const CommandResult run = RunCliphost("--aaf-library '" + library.string() + "' plugin");
+    const CommandResult run = RunCliphost("--aaf-library " + Quoted(library) + " plugin");
     EXPECT_EQ(run.status, 2);
     EXPECT_NE(run.out.find("is no AAF library: it lacks AAFFileOpenTransient"), std::string::npos)
         << run.out;

@@ -33,11 +33,3 @@ void ExpectSays(const CommandResult& result, int status, const std::string& word
     EXPECT_EQ(result.status, status) << result.out;
     EXPECT_NE(result.out.find(words), std::string::npos) << words << "\nis not in:\n" << result.out;
 }
-
-std::string Quoted(const std::filesystem::path& path) {
-    std::string quoted = "'";
-    for (const char c : path.string()) {
-        quoted += c == '\'' ? std::string("'\\''") : std::string(1, c);
-    }
-    return quoted + "'";
-}

@@ -2,8 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <filesystem>
 #include <string>
+
+#include "tests/support/Quoted.h"
 
 // What a command prints, and how it ends; fails the test when it can't run.
 struct CommandResult {
@@ -15,5 +16,3 @@ CommandResult RunCommand(const std::string& command);
 CommandResult RunCliphost(const std::string& arguments);
 // The same of its end: the exit status, and words among what it printed.
 void ExpectSays(const CommandResult& result, int status, const std::string& words);
-// A path as one word of the shell.
-std::string Quoted(const std::filesystem::path& path);

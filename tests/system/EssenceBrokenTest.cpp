@@ -46,8 +46,8 @@ protected:
     }
     std::filesystem::path HeaderFirst(const char* name) {
         const auto movie = folder() / (std::string("first_") + name);
-        EXPECT_EQ(RunCommand("ffmpeg -nostdin -y -v error -i " + MadeMovie(name).string() +
-                             " -map 0 -c copy -movflags +faststart " + movie.string())
+        EXPECT_EQ(RunCommand("ffmpeg -nostdin -y -v error -i " + Quoted(MadeMovie(name)) +
+                             " -map 0 -c copy -movflags +faststart " + Quoted(movie))
                       .status,
                   0);
         return movie;
@@ -84,7 +84,7 @@ TEST_F(EssenceBroken, PictureIsToldAndLeftOutByTheProgram) {
     const auto damaged = Damaged("png.mov", 1);
     const auto out = folder() / "frames";
     const CommandResult result =
-        RunCliphost("frame " + damaged.string() + " --range 0: -o " + out.string());
+        RunCliphost("frame " + Quoted(damaged) + " --range 0: -o " + Quoted(out));
     EXPECT_EQ(result.status, 1);
     EXPECT_NE(result.out.find("frame 1 is left out"), std::string::npos) << result.out;
     EXPECT_TRUE(std::filesystem::exists(out / "damaged_png_000000.png"));
@@ -92,7 +92,7 @@ TEST_F(EssenceBroken, PictureIsToldAndLeftOutByTheProgram) {
     EXPECT_TRUE(std::filesystem::exists(out / "damaged_png_000002.png"));
     // Alone it leaves no file at all.
     const auto single = folder() / "single.png";
-    EXPECT_EQ(RunCliphost("frame " + damaged.string() + " --frame 1 -o " + single.string()).status,
+    EXPECT_EQ(RunCliphost("frame " + Quoted(damaged) + " --frame 1 -o " + Quoted(single)).status,
               1);
     EXPECT_FALSE(std::filesystem::exists(single));
 }
@@ -103,7 +103,7 @@ TEST_F(EssenceBroken, LongGroupIsServedFromItsNextWholePicture) {
     ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=320x180:r=25:d=0.4 -c:v "
                          "libx264 -preset ultrafast -g 5 -x264-params scenecut=0 -bf 0 "
                          "-pix_fmt yuv420p " +
-                         movie.string())
+                         Quoted(movie))
                   .status,
               0);
     EssenceBytes whole;
@@ -165,7 +165,7 @@ TEST_F(EssenceBroken, CutFileServesWhatIsThere) {
 
 TEST_F(EssenceBroken, CutFileIsToldByTheSums) {
     const auto cut = Cut(HeaderFirst("mjpeg.mov"), 0.6);
-    const CommandResult result = RunCliphost("samples " + cut.string());
+    const CommandResult result = RunCliphost("samples " + Quoted(cut));
     EXPECT_EQ(result.status, 1);
     EXPECT_NE(result.out.find("wrong: "), std::string::npos) << result.out;
     EXPECT_NE(result.out.find("the file ends at"), std::string::npos) << result.out;
@@ -190,7 +190,7 @@ TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
     const auto cut = Cut(HeaderFirst("pcm_s16le.mov"), 0.2);
     const auto wav = folder() / "a.wav";
     const CommandResult result =
-        RunCliphost("audio " + cut.string() + " --start 8000 -o " + wav.string());
+        RunCliphost("audio " + Quoted(cut) + " --start 8000 -o " + Quoted(wav));
     EXPECT_EQ(result.status, 2) << result.out;
     EXPECT_NE(result.out.find("give --rate"), std::string::npos) << result.out;
     EXPECT_FALSE(std::filesystem::exists(wav));
@@ -198,12 +198,11 @@ TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
     const auto whole = folder() / "long.mov";
     ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=r=48000:d=4 -c:a pcm_s16le "
                          "-movflags +faststart " +
-                         whole.string())
+                         Quoted(whole))
                   .status,
               0);
-    ExpectSays(
-        RunCliphost("audio " + Cut(whole, 0.4).string() + " --rate 48000 -o " + wav.string()), 1,
-        "which could not be read");
+    ExpectSays(RunCliphost("audio " + Quoted(Cut(whole, 0.4)) + " --rate 48000 -o " + Quoted(wav)),
+               1, "which could not be read");
     EXPECT_EQ(Decoded(wav, "-f s24le -c:a pcm_s24le").size(), 192000u * 3);
 }
 
@@ -211,14 +210,14 @@ TEST_F(EssenceBroken, SoundOfWhichNothingCanBeReadLeavesNoFile) {
     const auto cut = Cut(HeaderFirst("pcm_s16le.mov"), 0.2);
     for (const char* const output : {"a.wav", "b.wav"}) {
         std::ofstream(folder() / "b.wav") << "before";
-        ExpectSays(RunCliphost("audio " + cut.string() + " --start 8000 --rate 48000 -o " +
-                               (folder() / output).string()),
+        ExpectSays(RunCliphost("audio " + Quoted(cut) + " --start 8000 --rate 48000 -o " +
+                               Quoted(folder() / output)),
                    1, "track 0: none of its samples from 8000 to 19199 could be read");
     }
     EXPECT_FALSE(std::filesystem::exists(folder() / "a.wav"));
     EXPECT_EQ(std::filesystem::file_size(folder() / "b.wav"), 6u) << "what was there stays";
     const CommandResult streamed =
-        RunCommand(Quoted(ProgramFolder() / "cliphost") + " audio " + cut.string() +
+        RunCommand(Quoted(ProgramFolder() / "cliphost") + " audio " + Quoted(cut) +
                    " --start 8000 --rate 48000 -o - 2>/dev/null");
     EXPECT_EQ(streamed.status, 1);
     EXPECT_EQ(streamed.out, "");

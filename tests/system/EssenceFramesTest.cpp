@@ -116,7 +116,7 @@ TEST_F(EssenceAlpha, OfEightBitsIsTheDecoders) {
         ASSERT_EQ(
             RunCommand("ffmpeg -nostdin -y -v error -f lavfi -i testsrc2=s=96x64:r=25:d=0.2 "
                        "-vf 'format=rgba,geq=r=r(X\\,Y):g=g(X\\,Y):b=b(X\\,Y):a=X*2+N' -c:v " +
-                       std::string(codec) + " " + movie.string())
+                       std::string(codec) + " " + Quoted(movie))
                 .status,
             0);
         Essence essence(session(), movie);
@@ -338,7 +338,7 @@ TEST_F(EssenceFrames, OfAStreamThatChangesItsSizeComeInOneSize) {
     const auto make = [&](const char* size, const char* pixels, const char* name) {
         return RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=" + std::string(size) +
                           ":r=25:d=0.12 -c:v mjpeg -q:v 2 -pix_fmt " + pixels + " " +
-                          (folder() / name).string())
+                          Quoted(folder() / name))
             .status;
     };
     ASSERT_EQ(make("160x120", "yuvj420p", "a.mov"), 0);
@@ -347,8 +347,8 @@ TEST_F(EssenceFrames, OfAStreamThatChangesItsSizeComeInOneSize) {
                         'f', 'i', 'l', 'e', ' ', 'b', '.', 'm', 'o', 'v', '\n'},
           "list.txt");
     const auto movie = folder() / "changes.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f concat -i " +
-                         (folder() / "list.txt").string() + " -c copy " + movie.string())
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f concat -i " + Quoted(folder() / "list.txt") +
+                         " -c copy " + Quoted(movie))
                   .status,
               0);
     EssenceBytes before;

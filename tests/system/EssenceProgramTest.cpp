@@ -16,7 +16,8 @@ using Json = nlohmann::json;
 
 class EssenceProgram : public SystemTest {
 protected:
-    std::string Out(const std::string& name) { return (folder() / name).string(); }
+    // A file to write, as a word of a command.
+    std::string Out(const std::string& name) { return Quoted(folder() / name); }
     std::size_t FilesLeft() {
         return static_cast<std::size_t>(
             std::distance(std::filesystem::directory_iterator(folder()), {}));
@@ -24,7 +25,7 @@ protected:
 };
 
 TEST_F(EssenceProgram, ShowsTheSampleMapAsTextAndJson) {
-    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    const auto movie = Quoted(MadeMovie("h264_with_aac.mov"));
     ExpectSays(RunCliphost("samples " + movie), 0, "all of it lies inside the file");
     const CommandResult result = RunCliphost("samples --json " + movie);
     ASSERT_EQ(result.status, 0) << result.out;
@@ -55,7 +56,7 @@ TEST_F(EssenceProgram, SaysUnknownWhereNoOffsetIsFound) {
 }
 
 TEST_F(EssenceProgram, ListsFormatsInWordsWithTheirBuffers) {
-    const auto movie = MadeMovie("prores_with_pcm.mov").string();
+    const auto movie = Quoted(MadeMovie("prores_with_pcm.mov"));
     ExpectSays(RunCliphost("formats " + movie), 0,
                "16-bit R'G'B' 4:4:4:4, big-endian words A R G B, video range");
     const Json json = Json::parse(RunCliphost("formats --json " + movie).out);
@@ -74,13 +75,13 @@ TEST_F(EssenceProgram, ListsFormatsInWordsWithTheirBuffers) {
 
 TEST_F(EssenceProgram, WritesSixteenBitPicturesOfDeepFormats) {
     const auto movie = MadeMovie("prores_hq_1080p.mov");
-    ExpectSays(RunCliphost("frame " + movie.string() + " --format deepest -o " + Out("a.png")), 0,
+    ExpectSays(RunCliphost("frame " + Quoted(movie) + " --format deepest -o " + Out("a.png")), 0,
                "1920 x 1080");
     EXPECT_EQ(RunCommand("ffprobe -v error -show_entries stream=width,height,pix_fmt -of csv=p=0 " +
                          Out("a.png"))
                   .out,
               "1920,1080,rgb48be\n");
-    ASSERT_EQ(RunCliphost("frame " + movie.string() + " -o " + Out("b.png")).status, 0);
+    ASSERT_EQ(RunCliphost("frame " + Quoted(movie) + " -o " + Out("b.png")).status, 0);
     EXPECT_EQ(
         RunCommand("ffprobe -v error -show_entries stream=pix_fmt -of csv=p=0 " + Out("b.png")).out,
         "rgb24\n");
@@ -101,7 +102,7 @@ TEST_F(EssenceProgram, WritesPicturesInTheRightColours) {
         SCOPED_TRACE(each.name);
         const auto movie = MadeMovie(each.name);
         ASSERT_EQ(
-            RunCliphost("frame " + movie.string() + " " + each.arguments + " -o " + Out("own.png"))
+            RunCliphost("frame " + Quoted(movie) + " " + each.arguments + " -o " + Out("own.png"))
                 .status,
             0);
         const EssenceBytes own = Decoded(folder() / "own.png", "-f rawvideo -pix_fmt rgb24");
@@ -120,7 +121,7 @@ TEST_F(EssenceProgram, WritesPicturesInTheRightColours) {
 }
 
 TEST_F(EssenceProgram, WritesAlphaAsAPictureAndIntoOne) {
-    const auto movie = MadeMovie("prores_4444_alpha.mov").string();
+    const auto movie = Quoted(MadeMovie("prores_4444_alpha.mov"));
     ASSERT_EQ(
         RunCliphost("frame " + movie + " --use-alpha --track 1 -o " + Out("alpha.png")).status, 0);
     EXPECT_EQ(
@@ -132,16 +133,16 @@ TEST_F(EssenceProgram, WritesAlphaAsAPictureAndIntoOne) {
         RunCommand("ffprobe -v error -show_entries stream=pix_fmt -of csv=p=0 " + Out("both.png"))
             .out,
         "rgba64be\n");
-    ExpectSays(RunCliphost("frame " + MadeMovie("png.mov").string() + " --with-alpha -o " +
+    ExpectSays(RunCliphost("frame " + Quoted(MadeMovie("png.mov")) + " --with-alpha -o " +
                            Out("none.png")),
                1, "it has no alpha track");
 }
 
 TEST_F(EssenceProgram, StreamsRawFramesToAnotherProgram) {
     const auto movie = MadeMovie("h264_bframes.mov");
-    const std::string cliphost = (ProgramFolder() / "cliphost").string();
+    const std::string cliphost = Quoted(ProgramFolder() / "cliphost");
     const CommandResult result =
-        RunCommand(cliphost + " frame " + movie.string() + " --range 2:9:3 -o - 2>" + Out("words"));
+        RunCommand(cliphost + " frame " + Quoted(movie) + " --range 2:9:3 -o - 2>" + Out("words"));
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.out.size(), 640u * 360 * 2 * 3);
     const movies::Bytes words = ReadFile(folder() / "words");
@@ -150,7 +151,7 @@ TEST_F(EssenceProgram, StreamsRawFramesToAnotherProgram) {
               std::string::npos);
     // The options that it tells are those that another program needs.
     const CommandResult piped = RunCommand(
-        cliphost + " frame " + movie.string() +
+        cliphost + " frame " + Quoted(movie) +
         " --range 0: -o - 2>/dev/null | ffmpeg -nostdin -v "
         "error -f rawvideo -pixel_format uyvy422 -video_size 640x360 -framerate 25/1 -i - "
         "-f rawvideo - | wc -c");
@@ -159,14 +160,15 @@ TEST_F(EssenceProgram, StreamsRawFramesToAnotherProgram) {
 
 TEST_F(EssenceProgram, StopsQuietlyWhenTheReaderOfItsFramesGoes) {
     const CommandResult result = RunCommand(
-        "bash -c '" + (ProgramFolder() / "cliphost").string() + " frame " +
-        MadeMovie("prores_with_pcm.mov").string() +
-        " --range 0: -o - 2>/dev/null | head -c 1000 >/dev/null; echo ${PIPESTATUS[0]}'");
+        "bash -c " +
+        Quoted(Quoted(ProgramFolder() / "cliphost") + " frame " +
+               Quoted(MadeMovie("prores_with_pcm.mov")) +
+               " --range 0: -o - 2>/dev/null | head -c 1000 >/dev/null; echo ${PIPESTATUS[0]}"));
     EXPECT_EQ(result.out, "0\n");
 }
 
 TEST_F(EssenceProgram, TellsWhatIsWrongWithACallAndLeavesNoFile) {
-    const auto movie = MadeMovie("h264_bframes.mov").string();
+    const auto movie = Quoted(MadeMovie("h264_bframes.mov"));
     ExpectSays(RunCliphost("frame " + movie + " --frame 10 -o " + Out("a.png")), 2,
                "there is no frame 10; it has 10 frames, 0 to 9");
     ExpectSays(RunCliphost("frame " + movie + " --range 20:30 -o " + Out("a.raw")), 2,
@@ -183,10 +185,10 @@ TEST_F(EssenceProgram, TellsWhatIsWrongWithACallAndLeavesNoFile) {
     ExpectSays(RunCliphost("frame " + movie), 2, "--output is required");
     ExpectSays(RunCliphost("frame nothing.mov -o " + Out("a.png")), 2, "there is no such file");
     ExpectSays(RunCliphost("audio " + movie + " -o " + Out("a.wav")), 1, "it has no sound track");
-    ExpectSays(RunCliphost("audio " + MadeMovie("pcm_u8.mov").string() + " --start 19200 -o " +
+    ExpectSays(RunCliphost("audio " + Quoted(MadeMovie("pcm_u8.mov")) + " --start 19200 -o " +
                            Out("a.wav")),
                2, "there is no sample 19200 of sound; it has 19200 samples, 0 to 19199");
-    ExpectSays(RunCliphost("frame " + MadeMovie("pcm_u8.mov").string() + " -o " + Out("a.png")), 1,
+    ExpectSays(RunCliphost("frame " + Quoted(MadeMovie("pcm_u8.mov")) + " -o " + Out("a.png")), 1,
                "it has no picture track");
     ExpectSays(RunCliphost("contact " + movie + " -o " + Out("no/such/a.png")), 2, "not written");
     EXPECT_EQ(FilesLeft(), 0u);
@@ -196,8 +198,8 @@ TEST_F(EssenceProgram, TellsOfAFullDisk) {
     if (!std::filesystem::exists("/dev/full")) {
         GTEST_SKIP() << "there is no /dev/full";
     }
-    const auto movie = MadeMovie("prores_with_pcm.mov").string();
-    const std::string cliphost = (ProgramFolder() / "cliphost").string();
+    const auto movie = Quoted(MadeMovie("prores_with_pcm.mov"));
+    const std::string cliphost = Quoted(ProgramFolder() / "cliphost");
     ExpectSays(RunCommand(cliphost + " frame " + movie + " -o - 2>&1 >/dev/full"), 2,
                "standard output: not written: No space left");
     ExpectSays(RunCliphost("audio " + movie + " -o /dev/full"), 2,
@@ -207,11 +209,11 @@ TEST_F(EssenceProgram, TellsOfAFullDisk) {
 TEST_F(EssenceProgram, SaysOfABadFileWhatWouldHelp) {
     const auto cut =
         Write(movies::Bytes{0, 0, 0, 20, 'f', 't', 'y', 'p', 'q', 't', ' ', ' '}, "short.mov");
-    ExpectSays(RunCliphost("formats " + cut.string()), 1, "copy it again");
+    ExpectSays(RunCliphost("formats " + Quoted(cut)), 1, "copy it again");
 }
 
 TEST_F(EssenceProgram, PutsFramesFromAllThroughTheMovieOnASheet) {
-    const auto movie = MadeMovie("h264_bframes.mov").string();
+    const auto movie = Quoted(MadeMovie("h264_bframes.mov"));
     ExpectSays(RunCliphost("contact " + movie + " --frames 6 --columns 3 --width 64 -o " +
                            Out("sheet.png")),
                0, "6 of 10 frames");
@@ -224,9 +226,9 @@ TEST_F(EssenceProgram, PutsFramesFromAllThroughTheMovieOnASheet) {
 
 TEST_F(EssenceProgram, ShowsNoProgressWhereThereIsNoTerminal) {
     const CommandResult result =
-        RunCliphost("frame " + MadeMovie("png.mov").string() + " --range 0: -o " + Out("frames"));
+        RunCliphost("frame " + Quoted(MadeMovie("png.mov")) + " --range 0: -o " + Out("frames"));
     EXPECT_EQ(result.status, 0);
-    EXPECT_EQ(result.out, Out("frames") + ": 3 pictures\n");
+    EXPECT_EQ(result.out, (folder() / "frames").string() + ": 3 pictures\n");
 }
 
 TEST_F(EssenceProgram, HelpsWithAnExampleForEachVerb) {

@@ -68,7 +68,7 @@ TEST_F(EssenceSound, IsExactToTheSampleAtAnyPlace) {
     const auto aac = folder() / "without_noise.mov";
     ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=440:sample_rate=48000:d=2 -c:a "
                          "aac -aac_pns 0 " +
-                         aac.string())
+                         Quoted(aac))
                   .status,
               0);
     for (const std::filesystem::path& movie :
@@ -121,15 +121,15 @@ TEST_F(EssenceSound, IsWrittenAsAWavFileThatFfmpegReads) {
         const auto movie = MadeMovie(sound.name);
         const auto wav = folder() / "sound.wav";
         const CommandResult result =
-            RunCliphost("audio " + movie.string() + " --track " + std::to_string(sound.track) +
-                        " -o " + wav.string());
+            RunCliphost("audio " + Quoted(movie) + " --track " + std::to_string(sound.track) +
+                        " -o " + Quoted(wav));
         EXPECT_EQ(result.status, 0) << result.out;
         EXPECT_TRUE(
             Decoded(wav, "-f s24le -c:a pcm_s24le") ==
             Decoded(movie, std::string("-map ") + sound.stream + " -f s24le -c:a pcm_s24le"));
         EXPECT_EQ(RunCommand("ffprobe -v error -show_entries stream=sample_rate,channels,"
                              "codec_name -of csv=p=0 " +
-                             wav.string())
+                             Quoted(wav))
                       .out.find("pcm_s24le,"),
                   0u);
     }
@@ -138,10 +138,9 @@ TEST_F(EssenceSound, IsWrittenAsAWavFileThatFfmpegReads) {
 TEST_F(EssenceSound, IsWrittenFromAnyPlace) {
     const auto movie = MadeMovie("pcm_s24le.mov");
     const auto wav = folder() / "piece.wav";
-    ASSERT_EQ(
-        RunCliphost("audio " + movie.string() + " --start 1000 --count 2001 -o " + wav.string())
-            .status,
-        0);
+    ASSERT_EQ(RunCliphost("audio " + Quoted(movie) + " --start 1000 --count 2001 -o " + Quoted(wav))
+                  .status,
+              0);
     const EssenceBytes all = Decoded(movie, "-f s24le -c:a pcm_s24le");
     const EssenceBytes piece = Decoded(wav, "-f s24le -c:a pcm_s24le");
     ASSERT_EQ(piece.size(), 2001u * 6);

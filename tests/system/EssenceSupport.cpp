@@ -26,9 +26,10 @@ double Ratio(const std::vector<Number>& a, const std::vector<Number>& b, double 
 
 }  // namespace
 
-EssenceBytes Decoded(const std::filesystem::path& movie, const std::string& arguments) {
-    const CommandResult result =
-        RunCommand("ffmpeg -nostdin -v quiet -i " + Quoted(movie) + " " + arguments + " -");
+EssenceBytes Decoded(const std::filesystem::path& movie, const std::string& arguments,
+                     const std::string& before) {
+    const CommandResult result = RunCommand("ffmpeg -nostdin -v quiet " + before + " -i " +
+                                            Quoted(movie) + " " + arguments + " -");
     EXPECT_EQ(result.status, 0) << movie << " " << arguments;
     return {result.out.begin(), result.out.end()};
 }

@@ -15,8 +15,10 @@
 
 using EssenceBytes = std::vector<std::uint8_t>;
 
-// What ffmpeg gives for a movie with arguments between it and the output.
-EssenceBytes Decoded(const std::filesystem::path& movie, const std::string& arguments);
+// What ffmpeg gives for a movie with arguments between it and the output, and
+// `before` in front of the movie.
+EssenceBytes Decoded(const std::filesystem::path& movie, const std::string& arguments,
+                     const std::string& before = "");
 
 // A packet of a stream as ffprobe reads it, without edit lists, in file order of
 // the stream, which is that of decoding.

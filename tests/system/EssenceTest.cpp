@@ -181,9 +181,9 @@ TEST_F(EssenceMap, CountsTheTracksThatTheDescriptionHas) {
 // in the description, so it can't be had; the user is told.
 TEST_F(EssenceMap, SaysThatTheSoundBehindASecondPictureCantBeDelivered) {
     const auto movie = folder() / "two_pictures.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -i " + MadeMovie("mjpeg.mov").string() + " -i " +
-                         MadeMovie("pcm_s16le.mov").string() +
-                         " -map 0:v -map 0:v -map 1:a -c copy " + movie.string())
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -i " + Quoted(MadeMovie("mjpeg.mov")) + " -i " +
+                         Quoted(MadeMovie("pcm_s16le.mov")) +
+                         " -map 0:v -map 0:v -map 1:a -c copy " + Quoted(movie))
                   .status,
               0);
     {
@@ -194,7 +194,7 @@ TEST_F(EssenceMap, SaysThatTheSoundBehindASecondPictureCantBeDelivered) {
                   std::string::npos);
     }
     const CommandResult result =
-        RunCliphost("audio " + movie.string() + " -o " + (folder() / "a.wav").string());
+        RunCliphost("audio " + Quoted(movie) + " -o " + Quoted(folder() / "a.wav"));
     EXPECT_EQ(result.status, 1);
     EXPECT_NE(result.out.find("more than one picture track"), std::string::npos) << result.out;
     EXPECT_FALSE(std::filesystem::exists(folder() / "a.wav"));
@@ -217,7 +217,7 @@ TEST_F(EssenceMap, IsThatOfThePictureTrackThatIsDescribedAndDelivered) {
         ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=64x48:r=25:d=0.4 "
                              "-f lavfi -i testsrc2=s=32x16:r=25:d=0.2 -map 0 -map 1 -c:v mpeg4 "
                              "-streamid 0:5 -streamid 1:2 -use_stream_ids_as_track_ids 1 " +
-                             std::string(each.options) + " " + movie.string())
+                             std::string(each.options) + " " + Quoted(movie))
                       .status,
                   0);
         Essence essence(session(), movie);

@@ -27,7 +27,7 @@ protected:
     std::filesystem::path WriteText(const std::string& text, const std::string& name) {
         return Write(movies::Bytes(text.begin(), text.end()), name);
     }
-    const std::string movie = "'" + MadeMovie(kInterlaced).string() + "'";
+    const std::string movie = Quoted(MadeMovie(kInterlaced));
 };
 
 TEST_F(ParamsVerb, PrintsChoicesWithAStarAtTheOneInUse) {
@@ -67,7 +67,7 @@ TEST_F(ParamsVerb, SaysWhatTheFileSaysWhereTheUserChoseNothing) {
                              Case{"h264_bframes.mov", "as the file says: progressive"},
                              Case{"pcm_u8.mov", "as the file says (default)"}}) {
         SCOPED_TRACE(each.movie);
-        const CommandResult ran = Params("'" + MadeMovie(each.movie).string() + "'");
+        const CommandResult ran = Params(Quoted(MadeMovie(each.movie)));
         EXPECT_EQ(ran.status, 0);
         EXPECT_EQ(Used(ran.out, "Field Ordering In File"), each.order) << ran.out;
         EXPECT_EQ(ran.out.find("none of these"), std::string::npos) << ran.out;
@@ -92,7 +92,7 @@ TEST_F(ParamsVerb, SaysWhatTheFileSaysBesideWhatTheUserChose) {
 TEST_F(ParamsVerb, PrintsTheNameOfASetOnOneLineWithoutCommandsToTheTerminal) {
     const auto file =
         WriteText(DocumentXml(SetXml(kSet, "", 1, "One&#10;two&#x9B;2J")), "name.xml");
-    const CommandResult ran = Params(movie + " --set-xml '" + file.string() + "'");
+    const CommandResult ran = Params(movie + " --set-xml " + Quoted(file));
     EXPECT_EQ(ran.status, 0);
     EXPECT_NE(ran.out.find(": One two 2J\n"), std::string::npos) << ran.out;
 }
@@ -101,11 +101,11 @@ TEST_F(ParamsVerb, PrintsDocumentsThatItTakesBack) {
     const CommandResult values = Params(movie + " --set 'Field Layout=Split' --xml values");
     EXPECT_EQ(values.status, 0);
     const auto file = WriteText(values.out, "values.xml");
-    const CommandResult again = Params(movie + " --set-xml '" + file.string() + "' --xml values");
+    const CommandResult again = Params(movie + " --set-xml " + Quoted(file) + " --xml values");
     EXPECT_EQ(again.status, 0);
     EXPECT_EQ(again.out, values.out);
-    const CommandResult reset = Params(movie + " --set 'Level Remapping=1' --reset --set-xml '" +
-                                       file.string() + "' --json");
+    const CommandResult reset =
+        Params(movie + " --set 'Level Remapping=1' --reset --set-xml " + Quoted(file) + " --json");
     EXPECT_EQ(reset.status, 0) << reset.out;
     EXPECT_NE(reset.out.find("\"value\": 512,"), std::string::npos) << "reset after the file";
     EXPECT_NE(reset.out.find("\"value\": 1,\n      \"default\": 16,"), std::string::npos)
@@ -128,8 +128,8 @@ TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
         {"--set 'Field Ordering=Interlaced'", 2, "several choices begin so"},
         {"--set 'Field Ordering'", 2, "name=value"},
         {"--set-xml /no/such/file.xml", 2, "there is no such file"},
-        {"--set-xml '" + broken.string() + "'", 2, "1:16: no element found"},
-        {"--set-xml '" + other.string() + "'", 0, "none was taken"},
+        {"--set-xml " + Quoted(broken), 2, "1:16: no element found"},
+        {"--set-xml " + Quoted(other), 0, "none was taken"},
         {"--xml everything", 2, "--xml"},
         {"--xml values --json", 2, "--json"},
     };
@@ -140,7 +140,7 @@ TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
     }
     EXPECT_EQ(Params("/no/such/movie.mov").status, 2);
     const auto text = WriteText("hello", "text.mov");
-    const CommandResult ran = Params("'" + text.string() + "'");
+    const CommandResult ran = Params(Quoted(text));
     EXPECT_EQ(ran.status, 1);
     EXPECT_NE(ran.out.find("text.mov: the file is no movie"), std::string::npos) << ran.out;
 }
@@ -153,7 +153,7 @@ TEST_F(ParamsVerb, OptionsChangeTheFormatsThatAreListed) {
                               "'><parameter id='6CAEDE80-2DE0-4E2F-9F5D-904B7A2C2F4A'>"
                               "<valueUInt32>4096</valueUInt32></parameter></parameterSet>"),
                   "bottom.xml");
-    const std::string fromFile = "--set-xml '" + document.string() + "'";
+    const std::string fromFile = "--set-xml " + Quoted(document);
     const struct {
         std::string options;
         const char* height;
@@ -176,11 +176,11 @@ TEST_F(ParamsVerb, OptionsChangeTheFormatsThatAreListed) {
 }
 
 TEST_F(ParamsVerb, OptionsChangeTheFrameThatIsWritten) {
-    const std::string picture = "'" + MadeMovie("png.mov").string() + "'";
+    const std::string picture = Quoted(MadeMovie("png.mov"));
     const auto frame = [&](const std::string& arguments) {
         const std::filesystem::path file = folder() / "frame.raw";
         const CommandResult ran =
-            RunCliphost("frame " + picture + " " + arguments + " -o '" + file.string() + "'");
+            RunCliphost("frame " + picture + " " + arguments + " -o " + Quoted(file));
         EXPECT_EQ(ran.status, 0) << ran.out;
         std::ifstream stream(file, std::ios::binary);
         return std::string((std::istreambuf_iterator<char>(stream)),
@@ -191,9 +191,8 @@ TEST_F(ParamsVerb, OptionsChangeTheFrameThatIsWritten) {
     ASSERT_FALSE(plain.empty());
     EXPECT_EQ(expanded.size(), plain.size());
     EXPECT_NE(expanded, plain);
-    EXPECT_EQ(
-        frame("--set-xml '" + WriteText(DocumentXml(SetXml(kSet, "", 1)), "up.xml").string() + "'"),
-        expanded);
+    EXPECT_EQ(frame("--set-xml " + Quoted(WriteText(DocumentXml(SetXml(kSet, "", 1)), "up.xml"))),
+              expanded);
     EXPECT_EQ(frame("--reset"), plain);
 }
 

@@ -16,7 +16,8 @@ using Json = nlohmann::json;
 
 class ProgramCalls : public SystemTest {
 protected:
-    std::string Out(const std::string& name) { return (folder() / name).string(); }
+    // A file of the test's folder, as a word of a command.
+    std::string Out(const std::string& name) { return Quoted(folder() / name); }
     std::string Copy(const std::string& made, const std::string& name) {
         std::filesystem::copy_file(MadeMovie(made), folder() / name);
         return Out(name);
@@ -28,20 +29,20 @@ protected:
 };
 
 std::string Program() {
-    return (ProgramFolder() / "cliphost").string();
+    return Quoted(ProgramFolder() / "cliphost");
 }
 
 TEST_F(ProgramCalls, NeverWriteOverTheMovie) {
     const auto movie = Copy("prores_with_pcm.mov", "a.mov");
-    const auto before = ReadFile(movie);
-    std::filesystem::create_hard_link(movie, folder() / "link.png");
+    const auto before = ReadFile(folder() / "a.mov");
+    std::filesystem::create_hard_link(folder() / "a.mov", folder() / "link.png");
     for (const std::string& call :
          {"describe " + movie + " --aaf " + movie,
           "describe " + movie + " --aaf " + Out("link.png"), "frame " + movie + " -o " + movie,
           "audio " + movie + " -o " + movie, "contact " + movie + " -o " + movie,
           "contact " + movie + " -o " + Out("link.png")}) {
         ExpectSays(RunCliphost(call), 2, "this is the movie itself");
-        EXPECT_EQ(ReadFile(movie), before) << call;
+        EXPECT_EQ(ReadFile(folder() / "a.mov"), before) << call;
     }
     EXPECT_EQ(FilesLeft(), 2u);
 }
@@ -97,7 +98,7 @@ TEST_F(ProgramCalls, SaveDescriptionsInFoldersThatAreThere) {
 }
 
 TEST_F(ProgramCalls, RefuseValuesThatMeanNothing) {
-    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    const auto movie = Quoted(MadeMovie("h264_with_aac.mov"));
     const auto expectRefused = [](const std::string& call, const std::string& words) {
         ExpectSays(RunCliphost(call), 2, words);
     };
@@ -133,7 +134,7 @@ TEST_F(ProgramCalls, RefuseValuesThatMeanNothing) {
 }
 
 TEST_F(ProgramCalls, RefuseEmptyTexts) {
-    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    const auto movie = Quoted(MadeMovie("h264_with_aac.mov"));
     for (const std::string& call :
          {std::string("describe ''"), "describe " + movie + " --aaf ''",
           "describe " + movie + " --out-dir ''", "describe " + movie + " --pin-time ''",
@@ -146,7 +147,7 @@ TEST_F(ProgramCalls, RefuseEmptyTexts) {
 }
 
 TEST_F(ProgramCalls, EndARangeWhoseNextFrameWouldBeBeyondAllNumbers) {
-    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    const auto movie = Quoted(MadeMovie("h264_with_aac.mov"));
     ExpectSays(
         RunCliphost("frame " + movie + " --range 1::18446744073709551615 -o " + Out("a.raw")), 0,
         "a.raw: 1 raw frame\n");
@@ -156,7 +157,7 @@ TEST_F(ProgramCalls, TellWhenStandardOutputTakesNothing) {
     if (!std::filesystem::exists("/dev/full")) {
         GTEST_SKIP() << "there is no /dev/full";
     }
-    const auto movie = MadeMovie("h264_with_aac.mov").string();
+    const auto movie = Quoted(MadeMovie("h264_with_aac.mov"));
     for (const std::string& call :
          {std::string("types"), std::string("plugin --json"), std::string("--help"),
           "describe " + movie, "samples --every " + movie, "params --xml values " + movie,
@@ -168,7 +169,7 @@ TEST_F(ProgramCalls, TellWhenStandardOutputTakesNothing) {
     }
     // More than is kept back, so that it fails amid the printing.
     const CommandResult amid = RunCommand(Program() + " samples --every " +
-                                          MadeMovie("pcm_u8.mov").string() + " 2>&1 >/dev/full");
+                                          Quoted(MadeMovie("pcm_u8.mov")) + " 2>&1 >/dev/full");
     EXPECT_EQ(amid.status, 2);
     EXPECT_EQ(amid.out, "cliphost: standard output: not written: No space left on device\n");
     EXPECT_EQ(RunCommand(Program() + " describe missing.mov 2>/dev/full").status, 2);
@@ -185,10 +186,9 @@ TEST_F(ProgramCalls, PrintIntoNoFileWhenStandardStreamsAreClosed) {
 TEST_F(ProgramCalls, GiveValidJsonForNamesThatAreNoUtf8) {
     std::filesystem::create_directory(folder() / "f\xFF");
     const auto movie = Copy("png.mov", "f\xFF/b\xFE name.mov");
-    const std::string quoted = "'" + movie + "'";
     for (const std::string& call :
-         {"scan --json '" + Out("f\xFF") + "'", "describe --json " + quoted,
-          "samples --json " + quoted, "formats --json " + quoted, "params --json " + quoted}) {
+         {"scan --json " + Out("f\xFF"), "describe --json " + movie, "samples --json " + movie,
+          "formats --json " + movie, "params --json " + movie}) {
         const CommandResult result = RunCommand(Program() + " " + call);
         EXPECT_EQ(result.status, 0) << call;
         EXPECT_TRUE(Json::accept(result.out)) << call << "\n" << result.out;
@@ -200,7 +200,7 @@ TEST_F(ProgramCalls, TakeThePathsBackThatTheyGiveInJson) {
     for (const char* const name : {"caf\xE9 \xFF.mov", "new\nline\x1B[2J.mov", "caf\xC3\xA9.mov"}) {
         SCOPED_TRACE(name);
         std::filesystem::create_directory(folder() / "in");
-        const auto movie = Quoted(Copy("png.mov", std::string("in/") + name));
+        const auto movie = Copy("png.mov", std::string("in/") + name);
         const auto takesBack = [&](const Json& path) {
             ASSERT_TRUE(path.is_string());
             const CommandResult again =
@@ -214,8 +214,7 @@ TEST_F(ProgramCalls, TakeThePathsBackThatTheyGiveInJson) {
         takesBack(json("samples --json " + movie)["movie"]);
         takesBack(json("formats --json " + movie)["movie"]);
         takesBack(json("params --json " + movie)["movie"]);
-        const Json described =
-            json("describe --json " + movie + " --out-dir " + Quoted(Out("out")))[0];
+        const Json described = json("describe --json " + movie + " --out-dir " + Out("out"))[0];
         takesBack(described["movie"]);
         std::string saved = described["aaf"].get<std::string>();
         host::text::PathOfFileUrl(saved, saved);
@@ -234,7 +233,7 @@ TEST_F(ProgramCalls, TellInTheirHelpHowJsonNamesPathsThatAreNoText) {
 
 TEST_F(ProgramCalls, ShowNamesWithControlsEscaped) {
     std::filesystem::create_directory(folder() / "in");
-    const auto movie = Quoted(Copy("h264_with_aac.mov", "in/a\nb\x1B[2J\xFF.mov"));
+    const auto movie = Copy("h264_with_aac.mov", "in/a\nb\x1B[2J\xFF.mov");
     const std::string shown = "/in/a\\nb\\x1B[2J\\xFF.mov";
     Write(movies::Bytes{'x'}, "in/bad\x1B.mov");
     for (const std::string& call :
@@ -255,12 +254,13 @@ TEST_F(ProgramCalls, ShowNamesWithControlsEscaped) {
 }
 
 TEST_F(ProgramCalls, LeaveNothingBehindWhenInterrupted) {
-    const auto movie = MadeMovie("prores_with_pcm.mov").string();
+    const auto movie = Quoted(MadeMovie("prores_with_pcm.mov"));
     // A raw file is open all the while the frames are read.
     const CommandResult result = RunCommand(
-        "bash -c 'set -m; " + Program() + " frame " + movie + " --range 0: -o " + Out("a.raw") +
-        " 2>/dev/null & for i in $(seq 2000); do ls " + folder().string() +
-        " | grep -q part && break; sleep 0.005; done; kill -TERM $!; wait $!; echo $?'");
+        "bash -c " +
+        Quoted("set -m; " + Program() + " frame " + movie + " --range 0: -o " + Out("a.raw") +
+               " 2>/dev/null & for i in $(seq 2000); do ls " + Quoted(folder()) +
+               " | grep -q part && break; sleep 0.005; done; kill -TERM $!; wait $!; echo $?"));
     EXPECT_TRUE(result.out == "143\n" || result.out == "0\n") << result.out;
     EXPECT_EQ(FilesLeft(), result.out == "0\n" ? 1u : 0u);
 }

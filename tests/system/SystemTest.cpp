@@ -12,8 +12,6 @@
 #include "reference_host/framework/ObjectCount.h"
 
 SystemTest::SystemTest() {
-    std::string pattern = std::filesystem::temp_directory_path() / "cliphost-system-XXXXXX";
-    folder_ = mkdtemp(pattern.data());
     options.programFolder = ProgramFolder();
     options.pinTime = "2026-01-31T12:00:00Z";
 }
@@ -43,9 +41,6 @@ bool SystemTest::ModuleIsIdle() {
 
 void SystemTest::TearDown() {
     End();
-    std::error_code ignored;
-    std::filesystem::permissions(folder_, std::filesystem::perms::owner_all, ignored);
-    std::filesystem::remove_all(folder_, ignored);
 }
 
 cliphost::TreeNode SystemTest::Describe(const std::filesystem::path& movie) {

@@ -11,6 +11,7 @@
 
 #include "reference_host/cliphost/Session.h"
 #include "reference_host/cliphost/TreeNode.h"
+#include "tests/support/TestFolder.h"
 #include "tests/support/movies/Movie.h"
 
 // A test that drives the built module through the reference host. At its end
@@ -42,10 +43,10 @@ protected:
     std::filesystem::path Write(const movies::Bytes& bytes, const std::string& name);
 
     // A folder of the test's own, gone with it.
-    std::filesystem::path folder() const { return folder_; }
+    std::filesystem::path folder() const { return folder_.path(); }
 
 private:
-    std::filesystem::path folder_;
+    const TestFolder folder_;
     std::set<std::string> filesAtStart_;
     std::int64_t hostObjectsAtStart_ = 0;
     std::unique_ptr<cliphost::Session> session_;

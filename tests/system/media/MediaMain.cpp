@@ -18,8 +18,7 @@ namespace {
 int Check(const std::filesystem::path& file) {
     cliphost::SessionOptions options;
     options.programFolder = ProgramFolder();
-    std::string pattern = std::filesystem::temp_directory_path() / "cliphost-media-XXXXXX";
-    const std::filesystem::path folder = mkdtemp(pattern.data());
+    const TestFolder folder;
     MediaVerdict verdict;
     bool isClean = true;
     {
@@ -29,7 +28,6 @@ int Check(const std::filesystem::path& file) {
         isClean = OpenFiles() == files && session.plugin().CanUnload() == NCF_OK;
     }
     isClean = isClean && host::LiveObjectCount() == 0;
-    std::filesystem::remove_all(folder);
     fmt::print("{}: {}\n", file.string(), verdict.summary);
     for (const std::string& difference : verdict.differences) {
         fmt::print("  {}\n", difference);

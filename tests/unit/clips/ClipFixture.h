@@ -15,6 +15,7 @@
 #include "host_interfaces/framework/HostSettings.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/clips/QuickTimeClip.h"
+#include "tests/support/TestFolder.h"
 #include "tests/support/fakes/FakeHost.h"
 #include "tests/support/fakes/RecordingLogger.h"
 #include "tests/support/fakes/parser/FakeParser.h"
@@ -23,31 +24,23 @@
 class TempFile {
 public:
     explicit TempFile(const std::vector<ncfUInt8>& bytes, const std::string& name = "clip.mov")
-        : path_(testing::TempDir() + UniquePrefix() + name) {
+        : path_((folder_ / name).string()) {
         std::ofstream file(path_, std::ios::binary);
         file.write(reinterpret_cast<const char*>(bytes.data()),
                    static_cast<std::streamsize>(bytes.size()));
     }
-    ~TempFile() { std::remove(path_.c_str()); }
-    TempFile(const TempFile&) = delete;
-    TempFile& operator=(const TempFile&) = delete;
 
     const std::string& path() const { return path_; }
 
 private:
-    // Tests run side by side, each in a process of its own, and so may two
-    // builds of the same tests.
-    static std::string UniquePrefix() {
-        static int count = 0;
-        const auto* const test = testing::UnitTest::GetInstance()->current_test_info();
-        std::string prefix = std::string(test->test_suite_name()) + "_" + test->name() + "_" +
-                             std::to_string(getpid()) + "_" + std::to_string(++count) + "_";
-        std::replace(prefix.begin(), prefix.end(), '/', '_');
-        return prefix;
-    }
-
+    TestFolder folder_;
     std::string path_;
 };
+
+// The path of a movie that is not there.
+inline std::string NoSuchMovie() {
+    return (TestFolder() / "no_such_movie.mov").string();
+}
 
 // Bytes that tell their own place: 0, 1, ... 250, 0, 1, ...
 inline std::vector<ncfUInt8> CountingBytes(std::size_t size) {

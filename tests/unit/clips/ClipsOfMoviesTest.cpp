@@ -8,6 +8,7 @@
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/xml/XmlDocument.h"
 #include "source/clips/LoadMedia.h"
+#include "tests/support/TestFolder.h"
 #include "tests/support/movies/Movie.h"
 #include "tests/unit/clips/ClipFixture.h"
 
@@ -76,9 +77,8 @@ protected:
     }
 
     const std::int64_t objectsBefore = host::LiveObjectCount();
-    const std::string path = testing::TempDir() + "clip_of_movie_" + std::to_string(getpid()) +
-                             "_" + testing::UnitTest::GetInstance()->current_test_info()->name() +
-                             ".mov";
+    const TestFolder folder;
+    const std::string path = (folder / "movie.mov").string();
     std::unique_ptr<FakeHost> host;
     Movie movie;
     Track video;

@@ -181,7 +181,7 @@ TEST_F(LoadMediaTest, TellsTheConsoleOfAMovieWithoutPictureAndSoundOnEachRoute) 
 
 TEST_F(LoadMediaTest, NeverTriesTheWrapperOnAFileThatCannotBeOpened) {
     RecordingNMALog lines(1);
-    EXPECT_THROW(Ask(testing::TempDir() + "no_such_movie.mov"), NCFRESULT);
+    EXPECT_THROW(Ask(NoSuchMovie()), NCFRESULT);
     EXPECT_EQ(host->creations(QTWrapper::CompID_QuickTimeWrapper), 0);
 }
 
@@ -203,7 +203,7 @@ TEST_F(LoadMediaTest, LetsTheSecondRouteThrowToo) {
 TEST_F(LoadMediaTest, LetsAFileThatCannotBeOpenedThrow) {
     RecordingNMALog lines(1);
     try {
-        Ask(testing::TempDir() + "no_such_movie.mov");
+        Ask(NoSuchMovie());
         FAIL() << "nothing was thrown";
     } catch (NCFRESULT result) {
         EXPECT_EQ(result, NCF_E_HANDLE);
@@ -250,11 +250,12 @@ TEST_F(LoadMediaTest, RefusesAnEmptyPath) {
 
 TEST_F(LoadMediaTest, TellsTheConsoleOfAFileThatCannotBeOpened) {
     RecordingNMALog lines(1);
-    EXPECT_EQ(IsContainer(testing::TempDir() + "no_such_movie.mov"), NCF_E_HANDLE);
+    EXPECT_EQ(IsContainer(NoSuchMovie()), NCF_E_HANDLE);
     EXPECT_EQ(flag, 0);
     EXPECT_EQ(Console(1, "Throw caught in QuickTimeContainer::IsContainerSupported: 80000006\n"),
               1);
-    EXPECT_EQ(IsContainer(testing::TempDir()), NCF_E_HANDLE) << "a folder is no file";
+    const TestFolder folder;
+    EXPECT_EQ(IsContainer(folder.path().string()), NCF_E_HANDLE) << "a folder is no file";
 }
 
 TEST_F(LoadMediaTest, ChecksTheArgumentsOfTheTestInOrder) {

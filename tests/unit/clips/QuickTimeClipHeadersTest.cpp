@@ -203,7 +203,7 @@ TEST_F(QuickTimeClipLoading, ThrowsWhenTheFileCannotBeOpened) {
     NCFSmartPtr<INCFConsole> console(&host->console());
     NCFSmartPtr<INCFComponentFactory> factory(host->factory());
     try {
-        QuickTimeClip missing(HostText(testing::TempDir() + "no_such_movie.mov"), console, factory);
+        QuickTimeClip missing(HostText(NoSuchMovie()), console, factory);
         FAIL() << "nothing was thrown";
     } catch (NCFRESULT result) {
         EXPECT_EQ(result, NCF_E_HANDLE);

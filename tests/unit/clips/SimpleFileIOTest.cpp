@@ -86,7 +86,8 @@ TEST(SimpleFileIO, KeepsItsOwnCopyOfThePath) {
 
 TEST(SimpleFileIO, DoesNotOpenFolders) {
     RecordingNMALog lines(1);
-    SimpleFileIO file(HostText(testing::TempDir()).inArg());
+    const TestFolder folder;
+    SimpleFileIO file(HostText(folder.path().string()).inArg());
     ncfUInt64 length = 0;
     EXPECT_THROW(file.GetFileSize(&length), NCFRESULT);
     EXPECT_TRUE(lines.contains("SimpleFileIO error. CreateFileW failed. HRESULT = 0x"));

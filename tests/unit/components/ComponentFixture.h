@@ -18,6 +18,7 @@
 #include "source/plugin/CNCFUnknown.h"
 #include "source/plugin/CreationFunctions.h"
 #include "source/plugin/NCFSmartPtr.h"
+#include "tests/support/TestFolder.h"
 #include "tests/support/fakes/RecordingLogger.h"
 
 // A folder of its own and a fake host that can make the components of the
@@ -25,8 +26,6 @@
 class ComponentFixture : public ::testing::Test {
 protected:
     ComponentFixture() {
-        std::filesystem::remove_all(folder);
-        std::filesystem::create_directories(folder);
         NMAInitialize(host.factory());
         serve(NMA::CompID_QuickTimeVolumeInfo, NMA::Impl::CreateQuickTimeVolumeInfo);
         serve(NMA::CompID_QuickTimeMediaFormat, NMA::Impl::CreateQuickTimeMediaFormat);
@@ -34,7 +33,6 @@ protected:
     }
     ~ComponentFixture() override {
         NMATerminate();
-        std::filesystem::remove_all(folder);
         EXPECT_EQ(GetObjectCount(), 0u) << "a component is left";
     }
 
@@ -76,7 +74,7 @@ protected:
         return string;
     }
 
-    const std::filesystem::path folder =
-        std::filesystem::temp_directory_path() / ("components-" + std::to_string(getpid()));
+    const TestFolder testFolder;
+    const std::filesystem::path folder = testFolder.path();
     FakeHost host;
 };

@@ -15,6 +15,7 @@
 #include "source/plugin/CNCFUnknown.h"
 #include "source/plugin/CreationFunctions.h"
 #include "source/plugin/PluginFolder.h"
+#include "tests/support/TestFolder.h"
 #include "tests/support/fakes/RecordingLogger.h"
 #include "tests/unit/descriptor_data/FakeSaxParser.h"
 
@@ -31,15 +32,9 @@ protected:
             return NMA::Impl::CreateGenericDocHandler(host.unknown(), nullptr, iid, out);
         });
         UseHostParser();
-        folder_ = std::filesystem::path(::testing::TempDir()) /
-                  (std::string("descriptor_data_") +
-                   ::testing::UnitTest::GetInstance()->current_test_info()->name() + "_" +
-                   std::to_string(reinterpret_cast<std::uintptr_t>(this)));
-        std::filesystem::create_directories(folder_);
     }
     ~DataHost() override {
         SetPluginFolder(nullptr);
-        std::filesystem::remove_all(folder_);
         NMATerminate();
         EXPECT_EQ(GetObjectCount(), 0u) << "components of the module are left";
     }
@@ -60,11 +55,9 @@ protected:
 
     // A file in the test's own folder; gives its path.
     std::string Write(const std::string& name, const std::string& text) {
-        const std::filesystem::path path = folder_ / name;
-        std::ofstream(path, std::ios::binary) << text;
-        return path.string();
+        return folder_.Write(name, text).string();
     }
-    std::string Folder() const { return folder_.string() + "/"; }
+    std::string Folder() const { return folder_.path().string() + "/"; }
     // Makes the test's own folder the module's.
     void MakeItTheModulesFolder() { SetModulesFolder(Folder()); }
     static void SetModulesFolder(const std::string& folder) {
@@ -79,5 +72,5 @@ protected:
     FakeSaxParser::Script script;
 
 private:
-    std::filesystem::path folder_;
+    const TestFolder folder_;
 };

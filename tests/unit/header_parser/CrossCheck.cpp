@@ -20,6 +20,7 @@
 
 #include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "tests/support/Quoted.h"
 
 namespace {
 
@@ -34,14 +35,10 @@ void Differ(const std::string& file, const std::string& what) {
 }
 
 json Probe(const std::string& file) {
-    std::string quoted = "'";
-    for (const char c : file) {
-        quoted += c == '\'' ? std::string("'\\''") : std::string(1, c);
-    }
     const std::string command =
         "ffprobe -v quiet -ignore_editlist 1 -of json -show_streams -show_packets "
         "-show_entries packet=stream_index,pts,dts,duration,size,pos,flags " +
-        quoted + "'";
+        Quoted(file);
     std::string text;
     if (FILE* pipe = popen(command.c_str(), "r")) {
         char buffer[65536];

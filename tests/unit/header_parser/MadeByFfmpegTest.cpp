@@ -9,6 +9,8 @@
 #include <iterator>
 #include <random>
 
+#include "tests/support/Quoted.h"
+#include "tests/support/TestFolder.h"
 #include "tests/unit/header_parser/ParsedMovie.h"
 
 // Short real movies, each made by the command above its expectations. Left out
@@ -22,19 +24,11 @@ protected:
         if (std::system("ffmpeg -version > /dev/null 2>&1") != 0) {
             GTEST_SKIP() << "ffmpeg is not installed";
         }
-        const auto* test = testing::UnitTest::GetInstance()->current_test_info();
-        file_ = std::filesystem::temp_directory_path() /
-                (std::string("header_parser_") + test->name() + "_" +
-                 std::to_string(std::random_device()()) + ".mov");
-    }
-    void TearDown() override {
-        std::error_code ignored;
-        std::filesystem::remove(file_, ignored);
     }
 
     ParsedMovie Make(const std::string& arguments) const {
         const std::string command =
-            "ffmpeg -y -v error " + arguments + " -bitexact " + file_.string();
+            "ffmpeg -y -v error " + arguments + " -bitexact " + Quoted(file_);
         EXPECT_EQ(std::system(command.c_str()), 0) << command;
         std::ifstream stream(file_, std::ios::binary);
         const movies::Bytes bytes{std::istreambuf_iterator<char>(stream),
@@ -44,7 +38,8 @@ protected:
         return parsed;
     }
 
-    std::filesystem::path file_;
+    const TestFolder folder_;
+    const std::filesystem::path file_ = folder_ / "made.mov";
 };
 
 TEST_F(MadeByFfmpeg, ProResWithTimecodeAndSound) {
@@ -134,7 +129,7 @@ TEST_F(MadeByFfmpeg, AFragmentedMovieIsRefused) {
     const std::string command =
         "ffmpeg -y -v error -f lavfi -i testsrc2=s=64x48:r=25:d=1 -c:v libx264 "
         "-movflags frag_keyframe+empty_moov " +
-        file_.string();
+        Quoted(file_);
     ASSERT_EQ(std::system(command.c_str()), 0);
     std::ifstream stream(file_, std::ios::binary);
     const movies::Bytes bytes{std::istreambuf_iterator<char>(stream),

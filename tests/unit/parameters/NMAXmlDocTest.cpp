@@ -3,11 +3,10 @@
 
 #include "source/parameters/NMAXmlDoc.h"
 
-#include <unistd.h>
-
 #include <filesystem>
 #include <fstream>
 
+#include "tests/support/TestFolder.h"
 #include "tests/unit/parameters/XmlTest.h"
 
 namespace {
@@ -82,8 +81,8 @@ TEST_F(XmlDocument, ComesOutAsItWentInButForCdata) {
 }
 
 TEST_F(XmlDocument, GoesThroughAFile) {
-    const std::string path =
-        (std::filesystem::temp_directory_path() / ("doc-" + std::to_string(getpid()) + ".xml"));
+    const TestFolder folder;
+    const std::string path = folder / "doc.xml";
     Doc doc(host.factory());
     doc.CreateRoot(S("root"));
     doc.GetRoot()->AddChildElementWithText(S("Name"), S("\xC3\xBC \xF0\x9F\x8E\xAC"));

@@ -9,6 +9,8 @@
 #include <limits>
 #include <string>
 
+#include "tests/support/Quoted.h"
+#include "tests/support/TestFolder.h"
 #include "tests/unit/parameters/ParamTest.h"
 
 namespace {
@@ -141,13 +143,12 @@ bool SetCommaLocale() {
             return true;
         }
     }
-    const std::string folder = testing::TempDir() + "comma_locale";
-    const std::string make =
-        "mkdir -p '" + folder + "' && localedef -i de_DE -f UTF-8 '" + folder + "/de_DE.UTF-8'";
+    const TestFolder folder;
+    const std::string make = "localedef -i de_DE -f UTF-8 " + Quoted(folder / "de_DE.UTF-8");
     if (std::system((make + " >/dev/null 2>&1").c_str()) != 0) {
         return false;
     }
-    setenv("LOCPATH", folder.c_str(), 1);
+    setenv("LOCPATH", folder.path().c_str(), 1);
     const bool isSet = std::setlocale(LC_NUMERIC, "de_DE.UTF-8") != nullptr;
     unsetenv("LOCPATH");
     return isSet;

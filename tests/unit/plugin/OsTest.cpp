@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "source/plugin/os/Os.h"
+#include "tests/support/TestFolder.h"
 
 #include <dlfcn.h>
 #include <fcntl.h>
@@ -43,14 +44,7 @@ namespace {
 
 class OperatingSystem : public ::testing::Test {
 protected:
-    OperatingSystem() {
-        std::filesystem::remove_all(folder);
-        std::filesystem::create_directories(folder);
-    }
-    ~OperatingSystem() override {
-        toldBlockSize = 0;
-        std::filesystem::remove_all(folder);
-    }
+    ~OperatingSystem() override { toldBlockSize = 0; }
 
     std::u16string write(const std::string& name, const std::string& bytes) {
         std::ofstream(folder / name, std::ios::binary) << bytes;
@@ -65,8 +59,8 @@ protected:
         return path;
     }
 
-    const std::filesystem::path folder =
-        std::filesystem::temp_directory_path() / ("os-test-" + std::to_string(getpid()));
+    const TestFolder testFolder;
+    const std::filesystem::path folder = testFolder.path();
 };
 
 TEST_F(OperatingSystem, ReadsAFileWhosePathHasBackslashes) {

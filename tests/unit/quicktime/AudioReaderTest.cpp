@@ -154,7 +154,7 @@ TEST(AudioReader, PlacesSoundAfterThePrimingThatTheEditListHides) {
 TEST(AudioReader, GivesSilenceForAnEmptyEdit) {
     NEEDS_FFMPEG();
     const MadeMovie plain("-f lavfi -i sine=d=1:r=48000 -c:a pcm_s16le");
-    const MadeMovie late("-itsoffset 0.5 -i " + plain.Path().string() +
+    const MadeMovie late("-itsoffset 0.5 -i " + plain.Quoted() +
                          " -f lavfi -i color=s=32x32:d=1 -map 0 -map 1 -c:a copy -c:v mpeg4");
     const auto reader = OpenSound(late.Path());
     ASSERT_TRUE(reader);

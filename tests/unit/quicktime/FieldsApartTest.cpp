@@ -20,7 +20,7 @@ protected:
         const MadeMovie stream(FieldCodedVideo(kPictures), ".h264");
         // Fifty packets a second.
         movie_ = std::make_unique<MadeMovie>(
-            "-f h264 -framerate 50 -i " + stream.Path().string() + " -c copy", GetParam());
+            "-f h264 -framerate 50 -i " + stream.Quoted() + " -c copy", GetParam());
     }
     std::unique_ptr<MadeMovie> movie_;
 };

@@ -10,20 +10,14 @@
 #include <fstream>
 #include <iterator>
 #include <limits>
-#include <random>
 #include <sstream>
 
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/quicktime/QuickTimeWrapper.h"
+#include "tests/support/Quoted.h"
 
 namespace quicktime_tests {
 namespace {
-
-std::filesystem::path NewPath(const std::string& ending) {
-    return std::filesystem::temp_directory_path() /
-           ("quicktime_test_" + std::to_string(std::random_device()()) + "_" +
-            std::to_string(std::random_device()()) + ending);
-}
 
 Bytes OutputOf(const std::string& command) {
     Bytes bytes;
@@ -47,20 +41,20 @@ bool HaveFfmpeg() {
 }
 
 MadeMovie::MadeMovie(const std::string& arguments, const std::string& ending)
-    : path_(NewPath(ending)) {
-    const std::string command = "ffmpeg -y -v error " + arguments + " " + path_.string();
+    : path_(folder_ / ("made" + ending)) {
+    const std::string command = "ffmpeg -y -v error " + arguments + " " + Quoted();
     EXPECT_EQ(std::system(command.c_str()), 0) << command;
 }
 
-MadeMovie::MadeMovie(const Bytes& content, const std::string& ending) : path_(NewPath(ending)) {
+MadeMovie::MadeMovie(const Bytes& content, const std::string& ending)
+    : path_(folder_ / ("made" + ending)) {
     std::ofstream(path_, std::ios::binary)
         .write(reinterpret_cast<const char*>(content.data()),
                static_cast<std::streamsize>(content.size()));
 }
 
-MadeMovie::~MadeMovie() {
-    std::error_code ignored;
-    std::filesystem::remove(path_, ignored);
+std::string MadeMovie::Quoted() const {
+    return ::Quoted(path_);
 }
 
 Bytes MadeMovie::Content() const {
@@ -69,12 +63,11 @@ Bytes MadeMovie::Content() const {
 }
 
 Bytes MadeMovie::Decoded(const std::string& arguments, const std::string& before) const {
-    return OutputOf("ffmpeg -v quiet " + before + " -i " + path_.string() + " " + arguments + " -");
+    return OutputOf("ffmpeg -v quiet " + before + " -i " + Quoted() + " " + arguments + " -");
 }
 
 std::vector<std::string> MadeMovie::Probed(const std::string& arguments) const {
-    const Bytes bytes =
-        OutputOf("ffprobe -v error -of csv=p=0 " + arguments + " " + path_.string());
+    const Bytes bytes = OutputOf("ffprobe -v error -of csv=p=0 " + arguments + " " + Quoted());
     std::istringstream text(std::string(bytes.begin(), bytes.end()));
     std::vector<std::string> lines;
     for (std::string line; std::getline(text, line);) {

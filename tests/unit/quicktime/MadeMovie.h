@@ -9,6 +9,7 @@
 
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
 #include "reference_host/framework/Ref.h"
+#include "tests/support/TestFolder.h"
 
 namespace quicktime_tests {
 
@@ -22,11 +23,10 @@ class MadeMovie {
 public:
     explicit MadeMovie(const std::string& arguments, const std::string& ending = ".mov");
     MadeMovie(const Bytes& content, const std::string& ending);
-    ~MadeMovie();
-    MadeMovie(const MadeMovie&) = delete;
-    MadeMovie& operator=(const MadeMovie&) = delete;
 
     const std::filesystem::path& Path() const { return path_; }
+    // The path as one word of a command.
+    std::string Quoted() const;
     Bytes Content() const;
     // What the ffmpeg command gives for the file with `arguments` between the
     // file and the output, which is raw, and `before` in front of the file.
@@ -35,6 +35,7 @@ public:
     std::vector<std::string> Probed(const std::string& arguments) const;
 
 private:
+    TestFolder folder_;
     std::filesystem::path path_;
 };
 

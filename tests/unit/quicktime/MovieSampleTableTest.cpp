@@ -87,7 +87,7 @@ TEST(MovieSampleTable, ListsThePacketsOfVideoInOrder) {
 TEST(MovieSampleTable, HoldsAlsoWhatTheEditListHides) {
     NEEDS_FFMPEG();
     const MadeMovie whole("-f lavfi -i testsrc2=s=64x48:r=25:d=2 -c:v libx264 -bf 2 -g 25");
-    const MadeMovie cut("-ss 0.6 -i " + whole.Path().string() + " -c copy");
+    const MadeMovie cut("-ss 0.6 -i " + whole.Quoted() + " -c copy");
     ExpectPacketsOfFfprobe(cut);
     ncfUInt64 count = 0;
     ASSERT_EQ(OpenTable(cut.Path())->GetNumSamples(1, &count), NCF_OK);

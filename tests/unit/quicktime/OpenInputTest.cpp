@@ -7,6 +7,7 @@
 #include <fstream>
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "tests/support/TestFolder.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;
@@ -15,15 +16,8 @@ namespace {
 
 class OpenInput : public testing::Test {
 protected:
-    OpenInput() {
-        std::string pattern = std::filesystem::temp_directory_path() / "open-input-XXXXXX";
-        folder_ = mkdtemp(pattern.data());
-    }
-    ~OpenInput() override { std::filesystem::remove_all(folder_); }
-
     std::filesystem::path Write(const std::string& name, const std::string& text) {
-        std::ofstream(folder_ / name, std::ios::binary) << text;
-        return folder_ / name;
+        return folder_.Write(name, text);
     }
     std::filesystem::path Make(const std::string& name, const std::string& arguments,
                                const std::string& ending) {
@@ -35,7 +29,7 @@ protected:
         return host::OpenInput(path, host::InputView::AsPresented, reason);
     }
 
-    std::filesystem::path folder_;
+    const TestFolder folder_;
 };
 
 // Lists open none of the files they name, not even those beside them.
@@ -68,7 +62,7 @@ TEST_F(OpenInput, TakesNamesAsTheyAre) {
 
 TEST_F(OpenInput, RefusesWhatIsNoFile) {
     std::string reason;
-    EXPECT_FALSE(Open(folder_, reason));
+    EXPECT_FALSE(Open(folder_.path(), reason));
     EXPECT_EQ(reason, "the file can't be read");
     EXPECT_FALSE(Open(folder_ / "absent.mov", reason));
     ASSERT_EQ(mkfifo((folder_ / "pipe.mov").c_str(), 0600), 0);

@@ -418,7 +418,7 @@ TEST(VideoReader, NumbersFromTheFirstPictureThatTheEditListShows) {
     NEEDS_FFMPEG();
     const MadeMovie whole(
         "-f lavfi -i testsrc2=s=96x64:r=25:d=2 -c:v libx264 -bf 2 -g 25 -pix_fmt yuv420p");
-    const MadeMovie cut("-ss 0.6 -i " + whole.Path().string() + " -c copy");
+    const MadeMovie cut("-ss 0.6 -i " + whole.Quoted() + " -c copy");
     ncfUInt64 count = 0;
     const Bytes shown = AllOf(cut, "2vuy", &count);
     EXPECT_EQ(count, 35u);

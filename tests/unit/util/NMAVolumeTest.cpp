@@ -26,7 +26,7 @@ protected:
         return names;
     }
 
-    TemporaryFolder folder_;
+    TestFolder folder_;
 };
 
 TEST_F(NMAVolumeTest, FindsFilesThatMatchThePattern) {

@@ -14,6 +14,7 @@
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/framework/String.h"
 #include "reference_host/util/text/HostText.h"
+#include "tests/support/TestFolder.h"
 
 // A host that the utility library is started with, and a look at the end
 // whether any of its objects was kept.
@@ -41,29 +42,4 @@ protected:
 
     host::Host host_;
     std::int64_t before_ = 0;
-};
-
-// A folder of its own for a test, gone afterwards.
-class TemporaryFolder {
-public:
-    TemporaryFolder() {
-        std::string name = (std::filesystem::temp_directory_path() / "cliphost-XXXXXX").string();
-        path_ = mkdtemp(name.data());
-    }
-    ~TemporaryFolder() {
-        std::error_code failure;
-        std::filesystem::remove_all(path_, failure);
-    }
-    TemporaryFolder(const TemporaryFolder&) = delete;
-    TemporaryFolder& operator=(const TemporaryFolder&) = delete;
-
-    const std::filesystem::path& path() const { return path_; }
-
-    std::filesystem::path Write(const std::string& name, const std::string& content = "x") const {
-        std::ofstream(path_ / name, std::ios::binary) << content;
-        return path_ / name;
-    }
-
-private:
-    std::filesystem::path path_;
 };

@@ -132,7 +132,7 @@ TEST_F(SaxParserTest, SaysWhatIsWrongWithTheFile) {
     EXPECT_EQ("/no/such.xml: there is no such file", LastMessage());
     EXPECT_TRUE(handler_->events.empty()) << "nothing starts without a file";
     EXPECT_EQ(1u, handler_->messages.size());
-    EXPECT_EQ(NCF_E_HANDLE, parser_->Parse(0, host::ModulePath(folder_).get()));
+    EXPECT_EQ(NCF_E_HANDLE, parser_->Parse(0, host::ModulePath(folder_.path()).get()));
     EXPECT_NE(std::string::npos, LastMessage().find("no file but a folder"));
 }
 

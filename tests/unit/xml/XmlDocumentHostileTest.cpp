@@ -66,7 +66,7 @@ TEST_F(XmlDocumentHostileTest, RefusesTextThatIsNoText) {
 TEST_F(XmlDocumentHostileTest, RefusesFilesThatAreNotThere) {
     const auto document = MakeRef<host::XmlDocument>();
     EXPECT_EQ(NCF_E_NOTFOUND, document->Load(host::ModulePath("/no/such.xml").get()));
-    EXPECT_EQ(NCF_E_HANDLE, document->Load(host::ModulePath(folder_).get()));
+    EXPECT_EQ(NCF_E_HANDLE, document->Load(host::ModulePath(folder_.path()).get()));
     EXPECT_EQ(NCF_E_POINTER, document->Load(nullptr));
     EXPECT_EQ(NCF_E_POINTER, document->LoadFromText(nullptr));
 }

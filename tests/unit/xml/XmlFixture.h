@@ -16,25 +16,18 @@
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/framework/String.h"
 #include "reference_host/util/text/HostText.h"
+#include "tests/support/TestFolder.h"
 
 // A folder for a test's files, and a look at the end whether any object was
 // kept.
 class XmlTest : public testing::Test {
 protected:
-    XmlTest() : before_(host::LiveObjectCount()) {
-        std::string name = (std::filesystem::temp_directory_path() / "cliphost-XXXXXX").string();
-        folder_ = mkdtemp(name.data());
-    }
-    ~XmlTest() override {
-        std::error_code failure;
-        std::filesystem::remove_all(folder_, failure);
-        EXPECT_EQ(before_, host::LiveObjectCount()) << "objects were kept";
-    }
+    XmlTest() : before_(host::LiveObjectCount()) {}
+    ~XmlTest() override { EXPECT_EQ(before_, host::LiveObjectCount()) << "objects were kept"; }
 
     // Writes a file and gives its path as the module would.
     host::Ref<host::String> File(const std::string& content, const char* name = "file.xml") const {
-        std::ofstream(folder_ / name, std::ios::binary) << content;
-        return host::ModulePath(folder_ / name);
+        return host::ModulePath(folder_.Write(name, content));
     }
 
     static std::string Nested(int levels) {
@@ -57,7 +50,7 @@ protected:
         return text;
     }
 
-    std::filesystem::path folder_;
+    const TestFolder folder_;
 
 private:
     std::int64_t before_;

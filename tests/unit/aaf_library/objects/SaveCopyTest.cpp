@@ -5,26 +5,20 @@
 #include <fstream>
 #include <iterator>
 
+#include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/objects/ClipDescription.h"
 
 namespace aaf_test {
 
 class SaveCopy : public ClipDescription {
 protected:
-    SaveCopy() {
-        std::string name =
-            "aaf_library_" +
-            std::string(::testing::UnitTest::GetInstance()->current_test_info()->name());
-        folder_ = std::filesystem::temp_directory_path() / name;
-        std::filesystem::remove_all(folder_);
-        std::filesystem::create_directories(folder_);
-    }
-    ~SaveCopy() override {
-        AAFCliphostPinTime(nullptr, nullptr);
-        std::filesystem::remove_all(folder_);
-    }
+    ~SaveCopy() override { AAFCliphostPinTime(nullptr, nullptr); }
 
-    std::wstring Path(const char* name) const { return (folder_ / name).wstring(); }
+    // By way of UTF-32, which needs no locale.
+    std::wstring Path(const char* name) const {
+        const std::u32string path = (folder_ / name).u32string();
+        return {path.begin(), path.end()};
+    }
     Ptr<IAAFFile> NewFile(const std::wstring& path,
                           const aafUID_t& kind = kAAFFileKind_Aaf512Binary, aafUInt32 flags = 0) {
         Ptr<IAAFFile> made;
@@ -42,7 +36,7 @@ protected:
         return {std::istreambuf_iterator<char>(stream), std::istreambuf_iterator<char>()};
     }
 
-    std::filesystem::path folder_;
+    const TestFolder folder_;
 };
 
 TEST_F(SaveCopy, WritesAFileThatReadsBackWhole) {

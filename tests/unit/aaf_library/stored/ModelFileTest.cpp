@@ -15,6 +15,7 @@
 #include "reference_host/aaf/stored/StoredNames.h"
 #include "reference_host/aaf/stored/TreeReader.h"
 #include "reference_host/aaf/stored/TreeWriter.h"
+#include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
 #include <gtest/gtest.h>
@@ -305,8 +306,7 @@ TEST(ModelFile, AFileKeepsWhatItSaysOfABuiltInDefinition) {
 }
 
 TEST(ModelFile, SavesAndLoadsByPathAndNamesThePathInErrors) {
-    const fs::path folder = fs::path(testing::TempDir()) / "model_file_test";
-    fs::create_directories(folder);
+    const TestFolder folder;
     const sample::SampleModel sample = sample::wholeModel();
     for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
         const FileResult saved = saveModel(*sample.model, *sample.header, folder / "a.aaf", size);
@@ -329,5 +329,4 @@ TEST(ModelFile, SavesAndLoadsByPathAndNamesThePathInErrors) {
     RefPtr<Object> header;
     EXPECT_EQ(loadModel(folder / "absent.aaf", *model, header).failure, FileFailure::NotThere);
     EXPECT_FALSE(header);
-    fs::remove_all(folder);
 }

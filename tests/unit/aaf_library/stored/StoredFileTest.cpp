@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/aaf/stored/StoredFile.h"
 
+#include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>
@@ -15,23 +16,12 @@ namespace {
 
 class StoredFile : public testing::Test {
 protected:
-    void SetUp() override {
-        const auto* test = testing::UnitTest::GetInstance()->current_test_info();
-        folder_ = fs::path(testing::TempDir()) /
-                  ("stored_" + std::string(test->name()) + std::to_string(getpid()));
-        fs::create_directories(folder_);
-    }
-    void TearDown() override { fs::remove_all(folder_); }
-
     static void put(const fs::path& path, const std::string& content) {
         std::ofstream(path, std::ios::binary) << content;
     }
-    std::size_t fileCount() const {
-        return static_cast<std::size_t>(
-            std::distance(fs::directory_iterator(folder_), fs::directory_iterator()));
-    }
+    std::size_t fileCount() const { return folder_.CountFiles(); }
 
-    fs::path folder_;
+    const TestFolder folder_;
 };
 
 }  // namespace

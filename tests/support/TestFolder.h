@@ -1,0 +1,48 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <iterator>
+#include <stdexcept>
+#include <string>
+
+// A folder of a test's own, gone with it. It lies where the system keeps
+// temporary files, no two have one name, and the name holds what a user's may
+// hold: a space, an accent, parentheses and both quotes.
+class TestFolder {
+public:
+    TestFolder() {
+        std::string pattern = std::filesystem::temp_directory_path() /
+                              std::filesystem::u8path("it's a \"t\xC3\xA9st\" (cliphost) XXXXXX");
+        if (!mkdtemp(pattern.data())) {
+            throw std::runtime_error("no folder for a test: " + pattern);
+        }
+        path_ = pattern;
+    }
+    ~TestFolder() {
+        std::error_code ignored;
+        std::filesystem::permissions(path_, std::filesystem::perms::owner_all, ignored);
+        std::filesystem::remove_all(path_, ignored);
+    }
+    TestFolder(const TestFolder&) = delete;
+    TestFolder& operator=(const TestFolder&) = delete;
+
+    std::filesystem::path operator/(const std::filesystem::path& name) const {
+        return path_ / name;
+    }
+    const std::filesystem::path& path() const { return path_; }
+    std::filesystem::path Write(const std::string& name, const std::string& content = "x") const {
+        std::ofstream(path_ / name, std::ios::binary) << content;
+        return path_ / name;
+    }
+    std::size_t CountFiles() const {
+        return static_cast<std::size_t>(
+            std::distance(std::filesystem::directory_iterator(path_), {}));
+    }
+
+private:
+    std::filesystem::path path_;
+};
