@@ -32,7 +32,8 @@ protected:
         ASSERT_EQ(AAFRESULT_SUCCESS, target->Close());
     }
     static std::string Content(const std::wstring& path) {
-        std::ifstream stream(std::filesystem::path(path), std::ios::binary);
+        std::ifstream stream(std::filesystem::path(std::u32string(path.begin(), path.end())),
+                             std::ios::binary);
         return {std::istreambuf_iterator<char>(stream), std::istreambuf_iterator<char>()};
     }
 
@@ -205,7 +206,8 @@ TEST_F(SaveCopy, RefusesWhatIsNoAafFile) {
     const std::wstring missing = Path("missing.aaf");
     EXPECT_EQ(AAFRESULT_FILE_NOT_FOUND, AAFFileOpenExistingRead(missing.c_str(), 0, read.Out()));
     const std::wstring text = Path("text.aaf");
-    std::ofstream(std::filesystem::path(text)) << "no compound file, but long enough for one";
+    std::ofstream(std::filesystem::path(std::u32string(text.begin(), text.end())))
+        << "no compound file, but long enough for one";
     EXPECT_EQ(AAFRESULT_NOT_AAF_FILE, AAFFileOpenExistingRead(text.c_str(), 0, read.Out()));
     aafUID_t kind{};
     aafBool is = kAAFTrue;
