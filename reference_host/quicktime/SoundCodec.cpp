@@ -54,41 +54,47 @@ std::unique_ptr<SoundCodec> SoundCodec::Open(const AVStream& stream, bool keepsP
 
 // The first part keeps the packet's time; the others follow it. The parser gives
 // a part when it sees what is behind it, so the last comes with the end, and a
-// parser does not go on behind that.
-void SoundCodec::Divide(const AVPacket& packet) {
-    const ParserOwner parser(av_parser_init(codec_->codec_id));
-    const ncfUInt8* at = packet.data;
-    int left = packet.size;
-    bool isFirst = true;
-    for (bool isEnd = !parser; !isEnd;) {
-        isEnd = left == 0;
+// parser does not go on behind that. Null when there are no more.
+PacketOwner SoundCodec::NextPart() {
+    while (parser_) {
+        const int left = whole_->size - divided_;
+        const bool isEnd = left <= 0;
         ncfUInt8* part = nullptr;
         int size = 0;
-        const int used = av_parser_parse2(parser.get(), codec_.get(), &part, &size,
-                                          isEnd ? nullptr : at, left, packet.pts, packet.dts, -1);
-        if (used < 0 || used > left || (used == 0 && size == 0)) {
-            return;
+        const int used = av_parser_parse2(parser_.get(), codec_.get(), &part, &size,
+                                          isEnd ? nullptr : whole_->data + divided_,
+                                          isEnd ? 0 : left, whole_->pts, whole_->dts, -1);
+        const bool isStuck = used < 0 || used > left || (used == 0 && size == 0);
+        PacketOwner owned(!isStuck && size > 0 ? av_packet_alloc() : nullptr);
+        if (owned && av_new_packet(owned.get(), size) >= 0) {
+            std::memcpy(owned->data, part, static_cast<std::size_t>(size));
+            if (isFirstPart_) {
+                av_packet_copy_props(owned.get(), whole_.get());
+            }
+            isFirstPart_ = false;
+        } else {
+            owned.reset();
         }
-        at += used;
-        left -= used;
-        PacketOwner owned(size > 0 ? av_packet_alloc() : nullptr);
-        if (!owned || av_new_packet(owned.get(), size) < 0) {
-            continue;
+        divided_ += isStuck ? 0 : used;
+        if (isStuck || isEnd) {
+            parser_.reset();
+            whole_.reset();
         }
-        std::memcpy(owned->data, part, static_cast<std::size_t>(size));
-        if (isFirst) {
-            av_packet_copy_props(owned.get(), &packet);
+        if (owned) {
+            return owned;
         }
-        isFirst = false;
-        parts_.push_back(std::move(owned));
     }
+    return nullptr;
 }
 
 void SoundCodec::Send(const AVPacket* packet) {
     if (!dividesPackets_) {
         avcodec_send_packet(codec_.get(), packet);
     } else if (packet) {
-        Divide(*packet);
+        whole_.reset(av_packet_clone(packet));
+        parser_.reset(whole_ ? av_parser_init(codec_->codec_id) : nullptr);
+        divided_ = 0;
+        isFirstPart_ = true;
     } else {
         isEnding_ = true;
     }
@@ -97,12 +103,15 @@ void SoundCodec::Send(const AVPacket* packet) {
 int SoundCodec::Receive(AVFrame& frame) {
     for (;;) {
         const int got = avcodec_receive_frame(codec_.get(), &frame);
+        // Some decoders give the first block the container's rate.
+        if (got >= 0 && codec_->sample_rate > 0) {
+            frame.sample_rate = codec_->sample_rate;
+        }
         if (got != AVERROR(EAGAIN)) {
             return got;
         }
-        if (!parts_.empty()) {
-            avcodec_send_packet(codec_.get(), parts_.front().get());
-            parts_.pop_front();
+        if (const PacketOwner part = NextPart()) {
+            avcodec_send_packet(codec_.get(), part.get());
         } else if (isEnding_) {
             isEnding_ = false;
             avcodec_send_packet(codec_.get(), nullptr);
@@ -114,7 +123,8 @@ int SoundCodec::Receive(AVFrame& frame) {
 
 void SoundCodec::Flush() {
     avcodec_flush_buffers(codec_.get());
-    parts_.clear();
+    parser_.reset();
+    whole_.reset();
     isEnding_ = false;
 }
 

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <deque>
 #include <memory>
 
 #include "host_interfaces/framework/Types.h"
@@ -20,18 +19,23 @@ public:
 
     // Takes a packet, or the end for null; what can't be decoded leaves a gap.
     void Send(const AVPacket* packet);
-    // As avcodec_receive_frame.
+    // As avcodec_receive_frame; the rate is that of the sound, whatever the
+    // container says.
     int Receive(AVFrame& frame);
     // Forgets all packets, for a jump.
     void Flush();
 
 private:
     explicit SoundCodec(CodecOwner codec) : codec_(std::move(codec)) {}
-    void Divide(const AVPacket& packet);
+    PacketOwner NextPart();
 
     CodecOwner codec_;
     bool dividesPackets_ = false;
-    std::deque<PacketOwner> parts_;  // of the last packet, not yet decoded
+    // The packet that is being divided, how far, and by what; null for none.
+    PacketOwner whole_;
+    int divided_ = 0;
+    bool isFirstPart_ = false;
+    ParserOwner parser_;
     bool isEnding_ = false;
 };
 

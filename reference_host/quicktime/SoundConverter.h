@@ -11,7 +11,9 @@ namespace host {
 
 // Sound as whole numbers of 32 bits in the channels and at the rate that were
 // promised. Nearly always a decoder gives just these; where a stream changes
-// on the way, channels are mixed and the rate is converted.
+// on the way, channels are mixed and the rate is converted. Rates that no stream
+// changes between are refused, and forms beyond the first few: each one more
+// costs memory and time.
 class SoundConverter {
 public:
     SoundConverter(int channels, int rate) : channels_(channels), rate_(rate) {}
@@ -19,27 +21,39 @@ public:
     // Whether a block is of another form than the one before, so that the rest
     // of that has to be taken first.
     bool HasRestBefore(const AVFrame& frame) const;
-    // Appends a block to `words`; false for a form that is unknown.
+    // Appends a block to `words`; false for a form that is unknown or refused.
     bool Append(const AVFrame& frame, std::vector<ncfSInt32>& words);
-    // Appends what the conversion of a rate still holds, and forgets it.
+    // Appends what the conversion of a rate still holds.
     void AppendRest(std::vector<ncfSInt32>& words);
-    void Forget();
+    void Forget();  // all forms, for a jump
 
-    // Whether a rate was converted: what comes out then leans on all before it.
-    bool HasConvertedRate() const { return hasConvertedRate_; }
+    // Frames by which what came out may be behind; 0 when no rate was converted.
+    int MostHeldBack() const { return mostHeldBack_; }
 
 private:
     bool IsAsPromised(const AVFrame& frame) const;
     bool Prepare(const AVFrame& frame);
+    ResamplerOwner MakeResampler(const AVFrame& frame) const;
     bool Convert(const AVFrame* frame, std::vector<ncfSInt32>& words);
 
     int channels_;
     int rate_;
-    ResamplerOwner resampler_;  // from the form below
-    int fromChannels_ = 0;
-    int fromRate_ = 0;
-    int fromFormat_ = AV_SAMPLE_FMT_NONE;
-    bool hasConvertedRate_ = false;
+    struct Form {
+        int channels;
+        int rate;
+        int format;
+        bool operator==(const Form& other) const {
+            return channels == other.channels && rate == other.rate && format == other.format;
+        }
+    };
+    static Form FormOf(const AVFrame& frame);
+    struct Kept {
+        Form from;
+        ResamplerOwner resampler;
+    };
+    std::vector<Kept> kept_;   // of all forms since decoding began
+    Kept* current_ = nullptr;  // the one that works, none while all is as promised
+    int mostHeldBack_ = 0;
 };
 
 }  // namespace host

@@ -40,9 +40,6 @@ ncfSInt64 Rescaled(ncfSInt64 value, AVRational from, AVRational to) {
     return std::clamp(av_rescale_q(value, from, to), -kFarthestTime, kFarthestTime);
 }
 
-// What a conversion of the rate may hold back.
-constexpr ncfSInt64 kConversionFrames = 64;
-
 }  // namespace
 
 std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& path, int stream,
@@ -185,7 +182,7 @@ bool SoundDecoder::MayDecodeOnTo(ncfSInt64 place) const {
     if (!isRunning_ || leansOnAll_ || place <= reached + kNearFrames) {
         return true;
     }
-    return countsPlaces_ && known_.back().place <= reached + kNearFrames;
+    return countsPlaces_ && !known_.empty() && known_.back().place <= reached + kNearFrames;
 }
 
 // Gives the decoder the next packet, and at last the end; false behind that.
@@ -323,14 +320,14 @@ bool SoundDecoder::PlaceBlock() {
             return false;
         }
         start = found->place;
-    } else if (isPlaced_ && (IsConverting() || time == AV_NOPTS_VALUE)) {
+    } else if (isPlaced_ && time == AV_NOPTS_VALUE) {
         start = follows;
     } else if (isPlaced_ && countsPlaces_ && lastTime_ != AV_NOPTS_VALUE) {
         const AVStream& of = *input_->streams[stream_];
-        start = follows + GapOfStep(time - lastTime_, framesSince_, of.time_base, rate_);
+        const ncfSInt64 gap = GapOfStep(time - lastTime_, framesSince_, of.time_base, rate_);
+        start = std::abs(gap) > converter_.MostHeldBack() ? follows + gap : follows;
     } else if (isPlaced_) {
-        const ncfSInt64 most =
-            converter_.HasConvertedRate() ? std::max(tolerance_, kConversionFrames) : tolerance_;
+        const ncfSInt64 most = std::max<ncfSInt64>(tolerance_, converter_.MostHeldBack());
         start = std::abs(start - follows) <= most ? follows : start;
     }
     isPlaced_ = true;
