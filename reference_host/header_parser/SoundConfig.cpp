@@ -40,6 +40,12 @@ ncfUInt32 TakeAacRate(BitReader& bits) {
     return index < std::size(kRates) ? kRates[index] : 0;
 }
 
+// The kinds whose configuration goes on with that of the filter bank coder.
+bool IsGeneralAudio(ncfUInt32 type) {
+    constexpr ncfUInt32 kTypes[] = {1, 2, 3, 4, 7, 17, 19, 21, 22, 23};
+    return std::find(std::begin(kTypes), std::end(kTypes), type) != std::end(kTypes);
+}
+
 // Channels of a program config element, which follows where no usual
 // arrangement is named.
 ncfUInt32 TakeProgramChannels(BitReader& bits) {
@@ -68,6 +74,7 @@ Told ReadAacConfig(const Atom& config) {
     constexpr ncfUInt32 kChannels[] = {0, 1, 2, 3, 4, 5, 6, 8, 0, 0, 0, 7, 8, 24, 8, 0};
     BitReader bits(config.begin, config.end);
     const ncfUInt32 type = TakeObjectType(bits);
+    ncfUInt32 core = type;
     const ncfUInt32 rate = TakeAacRate(bits);
     const ncfUInt32 arrangement = bits.Take(4);
     Extension bands = Extension::kUntold;
@@ -76,11 +83,11 @@ Told ReadAacConfig(const Atom& config) {
     if (type == kSpectralBands || type == kParametricStereo) {
         bands = Extension::kYes;
         extendedRate = TakeAacRate(bits);
-        TakeObjectType(bits);
+        core = TakeObjectType(bits);
     }
     Told told;
     told.channels = kChannels[arrangement];
-    if (arrangement == 0) {
+    if (arrangement == 0 && IsGeneralAudio(core)) {
         BitReader program = bits;
         program.Skip(1);                        // length of a frame
         program.Skip(program.Flag() ? 14 : 0);  // delay of a core coder
@@ -229,8 +236,9 @@ Told ReadEac3Config(const Atom& dec3) {
     told.channels = TakeAc3Channels(bits);
     bits.Skip(3);
     if (bits.Take(4) != 0) {
-        // Further places of speakers: single ones, and pairs.
-        constexpr ncfUInt32 kSpeakers[] = {2, 2, 1, 1, 2, 2, 2, 1, 1};
+        // Further places of speakers: single ones, and pairs. The pair between
+        // the middle and the sides has the lowest bit.
+        constexpr ncfUInt32 kSpeakers[] = {1, 1, 2, 2, 2, 1, 1, 2, 2};
         for (const ncfUInt32 speakers : kSpeakers) {
             told.channels += bits.Flag() ? speakers : 0;
         }
@@ -284,6 +292,12 @@ Atom FindConfig(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt32 type) {
 }
 
 }  // namespace
+
+AacSound ReadAacSound(const ncfUInt8* begin, const ncfUInt8* end) {
+    const Atom config{Code("esds"), begin, end};
+    const Told told = config.Size() >= 2 ? ReadAacConfig(config) : Told();
+    return {told.channels, told.rate};
+}
 
 void ReadSoundConfig(ncfUInt32 codec, const ncfUInt8* begin, const ncfUInt8* end,
                      SoundDescription& description) {

@@ -15,4 +15,12 @@ namespace header_parser {
 void ReadSoundConfig(ncfUInt32 codec, const ncfUInt8* begin, const ncfUInt8* end,
                      SoundDescription& description);
 
+// What the configuration of AAC tells by itself; 0 for what it does not tell.
+// Extensions count where it announces them.
+struct AacSound {
+    ncfUInt32 channels = 0;
+    ncfUInt32 rate = 0;
+};
+AacSound ReadAacSound(const ncfUInt8* begin, const ncfUInt8* end);
+
 }  // namespace header_parser

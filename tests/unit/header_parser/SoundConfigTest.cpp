@@ -104,6 +104,21 @@ TEST(SoundConfig, OfAacCountsTheChannelsOfAProgram) {
     EXPECT_EQ(Parse("mp4a", Esds(0x40, config)), (Told{6, 48000}));
 }
 
+// Of another kind, here of speech, the same bits mean something else.
+TEST(SoundConfig, OfAacWithoutAProgramLeavesTheChannels) {
+    const Bytes config = {0x41, 0x80, 0x04, 0xC8, 0x05, 0x00, 0x01, 0x08, 0x80};
+    EXPECT_EQ(Parse("mp4a", Esds(0x40, config)), (Told{2, 48000}));
+}
+
+// Each bit of the further speakers by itself, from the highest.
+TEST(SoundConfig, OfEac3CountsFurtherSpeakersByTheirBits) {
+    constexpr unsigned kSpeakers[] = {1, 1, 2, 2, 2, 1, 1, 2, 2};
+    for (unsigned i = 0; i < 9; ++i) {
+        const Box config = Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U16(0x0200 | 0x100u >> i);
+        EXPECT_EQ(Parse("ec-3", config), (Told{6 + kSpeakers[i], 48000})) << i;
+    }
+}
+
 TEST(SoundConfig, OfOtherKindsTellsChannelsAndRate) {
     Box opus("dOps");
     opus.U8(0).U8(1).U16(312).U32(44100).U16(0).U8(0);
@@ -112,7 +127,7 @@ TEST(SoundConfig, OfOtherKindsTellsChannelsAndRate) {
     EXPECT_EQ(Parse("ac-3", Box("dac3").U8(0x10).U8(0x3D).U8(0x40)), (Told{6, 48000}));
     EXPECT_EQ(Parse("ac-3", Box("dac3").U8(0x12).U8(0x10).U8(0)).rate, 24000);
     EXPECT_EQ(Parse("ec-3", Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U8(0)), (Told{6, 48000}));
-    EXPECT_EQ(Parse("ec-3", Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U16(0x0280)),
+    EXPECT_EQ(Parse("ec-3", Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U16(0x0202)),
               (Told{8, 48000}));
     EXPECT_EQ(Parse("fLaC", Box("dfLa").Version(0).U32(0x80000022).Zeros(10).U32(0x0AC440F0)),
               (Told{1, 44100}));
