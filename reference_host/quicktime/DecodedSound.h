@@ -3,8 +3,8 @@
 #pragma once
 
 #include <filesystem>
-
-#include "reference_host/quicktime/AvOwners.h"
+#include <map>
+#include <vector>
 
 namespace host {
 
@@ -15,9 +15,12 @@ struct DecodedSound {
     int channels = 0;  // 0: nothing could be decoded
     int rate = 0;
     int framesPerPacket = 0;  // 0: it varies
+    int containerRate = 0;    // by the container's header alone
 };
 
-// Decodes the first packets of a stream.
-DecodedSound DecodeFirstSound(const std::filesystem::path& path, int stream);
+// Decodes the first packets of streams, by their numbers. The file is read once
+// for many of them.
+std::map<int, DecodedSound> DecodeFirstSounds(const std::filesystem::path& path,
+                                              const std::vector<int>& streams);
 
 }  // namespace host

@@ -23,7 +23,7 @@ std::unique_ptr<EditedSound> EditedSound::Open(const std::filesystem::path& path
     const auto pieces = std::count_if(source.edits.begin(), source.edits.end(),
                                       [](const auto& edit) { return edit.mediaTime >= 0; });
     const bool isCut = hasWholeIndex && pieces > 1 && source.timeScale > 0;
-    auto decoder = SoundDecoder::Open(path, source.stream, hasWholeIndex,
+    auto decoder = SoundDecoder::Open(path, source.stream, source.form, hasWholeIndex,
                                       isCut ? InputView::WholeMedia : InputView::AsPresented);
     if (!decoder) {
         return nullptr;

@@ -16,6 +16,7 @@ public:
         int stream = -1;
         std::vector<MovieAtoms::Edit> edits;  // none: as the library presents it
         ncfUInt32 timeScale = 0;              // of the durations of edits
+        SoundForm form;                       // as it is delivered
     };
     static std::unique_ptr<EditedSound> Open(const std::filesystem::path& path,
                                              const Source& source, bool hasWholeIndex);

@@ -241,16 +241,11 @@ const AVStream* MovieFile::FindDetailedTrack(ncfUInt32 track) {
 }
 
 const SoundForm* MovieFile::SoundFormOf(ncfUInt32 track) {
-    const int stream = StreamOf(track);
-    if (stream < 0) {
-        return nullptr;
+    if (!soundForms_) {
+        soundForms_ = ReadSoundForms(path_, *input_, IndexIsWhole());
     }
-    const auto [entry, isNew] = soundForms_.try_emplace(stream);
-    SoundForm form;
-    if (isNew && ReadSoundForm(path_, *input_->streams[stream], IndexIsWhole(), form)) {
-        entry->second = form;
-    }
-    return entry->second ? &*entry->second : nullptr;
+    const auto found = soundForms_->find(StreamOf(track));
+    return found == soundForms_->end() ? nullptr : &found->second;
 }
 
 AVFieldOrder MovieFile::ContainerFieldOrder(ncfUInt32 track) const {

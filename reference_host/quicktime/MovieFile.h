@@ -101,7 +101,7 @@ private:
     ncfUInt64 counted_ = 0;  // pictures found so far
     bool countedAll_ = false;
     std::map<int, double> secondsOfPackets_;
-    std::map<int, std::optional<SoundForm>> soundForms_;
+    std::optional<std::map<int, SoundForm>> soundForms_;  // by stream
 };
 
 }  // namespace host

@@ -72,6 +72,8 @@ NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader)
                 EditedSound::Source& source = streams[track];
                 source.stream = stream;
                 source.timeScale = movie_->Atoms().timeScale;
+                const SoundForm* const form = movie_->SoundFormOf(track);
+                source.form = form ? *form : SoundForm();
                 if (const MovieAtoms::Track* const atoms = movie_->FindAtoms(track)) {
                     source.edits = atoms->edits;
                 }

@@ -29,6 +29,7 @@ bool LeansOnAllBefore(AVCodecID codec) {
         case AV_CODEC_ID_ADPCM_G726:
         case AV_CODEC_ID_MACE3:
         case AV_CODEC_ID_MACE6:
+        case AV_CODEC_ID_NELLYMOSER:
             return true;
         default:
             return false;
@@ -43,7 +44,8 @@ ncfSInt64 Rescaled(ncfSInt64 value, AVRational from, AVRational to) {
 }  // namespace
 
 std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& path, int stream,
-                                                 bool hasWholeIndex, InputView view) {
+                                                 const SoundForm& form, bool hasWholeIndex,
+                                                 InputView view) {
     std::string ignored;
     InputOwner input = OpenInput(path, view, ignored);
     if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
@@ -54,8 +56,7 @@ std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& pa
     }
     const AVStream& of = *input->streams[stream];
     auto codec = SoundCodec::Open(of, false);
-    SoundForm form;
-    if (!codec || !ReadSoundForm(path, of, hasWholeIndex, form)) {
+    if (!codec || form.channels == 0 || of.codecpar->codec_type != AVMEDIA_TYPE_AUDIO) {
         return nullptr;
     }
     UseOneStream(*input, stream);
@@ -279,25 +280,30 @@ void SoundDecoder::PlaceRest() {
 // The place that the index gives the block; nothing where it does not know it,
 // or turns out to be wrong about how much packets hold.
 std::optional<ncfSInt64> SoundDecoder::PlaceByMap() {
-    const std::optional<ncfSInt64> packet = places_->Of(frame_->pkt_dts);
+    const ncfSInt64 time = UsableTime(frame_->pkt_dts);
+    const auto packet = time == AV_NOPTS_VALUE ? std::nullopt : places_->LastAt(time);
     if (!packet) {
         return std::nullopt;
     }
-    // Priming is cut from a packet's start, and the frame's time tells how much.
+    // Where the library cuts a packet's start, as priming or by an edit, it moves
+    // all its times on by what is cut. What is left of the packet tells it to the
+    // frame.
     const AVStream& of = *input_->streams[stream_];
-    const ncfSInt64 time = UsableTime(frame_->best_effort_timestamp);
-    const ncfSInt64 cut = time == AV_NOPTS_VALUE ? 0
-                                                 : Rescaled(time - frame_->pkt_dts, of.time_base,
-                                                            AVRational{1, rate_});
-    const bool follows = lastMapped_ && *packet == *lastMapped_ + framesPerPacket_;
-    if (follows && cut == 0 && *packet != blockStart_ + blockCount_) {
+    const ncfSInt64 moved = Rescaled(time - packet->time, of.time_base, AVRational{1, rate_});
+    const ncfSInt64 missing = framesPerPacket_ - static_cast<ncfSInt64>(block_.size()) / channels_;
+    const bool isCut = time != packet->time;
+    if (isCut && (moved >= framesPerPacket_ || std::abs(missing - moved) > tolerance_)) {
+        return std::nullopt;
+    }
+    const bool follows = lastMapped_ && packet->place == *lastMapped_ + framesPerPacket_;
+    if (follows && !isCut && packet->place != blockStart_ + blockCount_) {
         places_.reset();
         countsPlaces_ = true;
         DecodeFromStartAlways();
         return std::nullopt;
     }
-    lastMapped_ = *packet;
-    return *packet + cut;
+    lastMapped_ = packet->place;
+    return packet->place + (isCut ? missing : 0);
 }
 
 // Finds the place of the block that was decoded; false for one that can't be

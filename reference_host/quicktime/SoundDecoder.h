@@ -19,13 +19,13 @@ namespace host {
 
 // Decodes one sound track by place: 0 is the first sample that the movie
 // presents, and what an edit leaves empty is silence. Channels and rate are
-// those of the first packets; what changes on the way is brought to them.
+// those of its form; what changes on the way is brought to them.
 class SoundDecoder {
 public:
     // `hasWholeIndex`: the file is a movie whose own time begins at 0. Other
     // files, and movies in fragments, begin where their first stream does.
     static std::unique_ptr<SoundDecoder> Open(const std::filesystem::path& path, int stream,
-                                              bool hasWholeIndex,
+                                              const SoundForm& form, bool hasWholeIndex,
                                               InputView view = InputView::AsPresented);
 
     int Channels() const { return channels_; }

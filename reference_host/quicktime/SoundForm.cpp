@@ -9,7 +9,9 @@ extern "C" {
 }
 
 #include <string_view>
+#include <vector>
 
+#include "reference_host/header_parser/SoundConfig.h"
 #include "reference_host/quicktime/DecodedSound.h"
 
 namespace host {
@@ -114,6 +116,38 @@ ncfUInt32 FormatIdOf(const AVCodecParameters& parameters) {
     return tag << 24 | (tag & 0xFF00u) << 8 | (tag >> 8 & 0xFF00u) | tag >> 24;
 }
 
+// Its packets tell their form themselves, headers of movies have no place for it
+// but the fields.
+bool IsMpegAudio(AVCodecID codec) {
+    return codec == AV_CODEC_ID_MP1 || codec == AV_CODEC_ID_MP2 || codec == AV_CODEC_ID_MP3;
+}
+
+// Puts channels and rate right. What the library says of them is no help: it
+// changes as it reads on.
+void Deliver(const DecodedSound& decoded, const AVCodecParameters& parameters, bool hasWholeIndex,
+             SoundForm& form) {
+    const bool isTold = hasWholeIndex && parameters.codec_id == AV_CODEC_ID_AAC &&
+                        parameters.extradata && parameters.extradata_size > 0;
+    const header_parser::AacSound told =
+        isTold ? header_parser::ReadAacSound(parameters.extradata,
+                                             parameters.extradata + parameters.extradata_size)
+               : header_parser::AacSound();
+    if (told.rate != 0 && told.rate <= kHighestRate &&
+        told.rate != static_cast<ncfUInt32>(decoded.rate)) {
+        form.sampleRate = told.rate;
+        form.channels = told.channels != 0 ? told.channels : form.channels;
+    } else if (hasWholeIndex && IsMpegAudio(parameters.codec_id) && decoded.channels > 0 &&
+               decoded.channels <= kMostChannels && decoded.rate != decoded.containerRate &&
+               decoded.containerRate > 0) {
+        form.channels = static_cast<ncfUInt32>(decoded.channels);
+        form.sampleRate = decoded.containerRate;
+    } else if (decoded.channels > 0 && decoded.channels <= kMostChannels && decoded.rate > 0) {
+        form.channels = static_cast<ncfUInt32>(decoded.channels);
+        form.sampleRate = decoded.rate;
+        form.decodedPerPacket = decoded.framesPerPacket;
+    }
+}
+
 }  // namespace
 
 bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
@@ -141,26 +175,24 @@ bool ReadSoundForm(const AVStream& stream, SoundForm& out) {
     return true;
 }
 
-bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, bool hasWholeIndex,
-                   SoundForm& out) {
-    SoundForm form;
-    if (!ReadSoundForm(stream, form)) {
-        return false;
-    }
-    if (form.bitsPerChannel == 0) {
-        const DecodedSound decoded = DecodeFirstSound(path, stream.index);
-        const AVCodecParameters& told = *stream.codecpar;
-        const bool isMoreThanTold =
-            hasWholeIndex && told.codec_id == AV_CODEC_ID_AAC && decoded.rate > told.sample_rate;
-        if (decoded.channels > 0 && decoded.channels <= kMostChannels && decoded.rate > 0 &&
-            !isMoreThanTold) {
-            form.channels = static_cast<ncfUInt32>(decoded.channels);
-            form.sampleRate = decoded.rate;
-            form.decodedPerPacket = decoded.framesPerPacket;
+std::map<int, SoundForm> ReadSoundForms(const std::filesystem::path& path,
+                                        const AVFormatContext& input, bool hasWholeIndex) {
+    std::map<int, SoundForm> forms;
+    std::vector<int> compressed;
+    for (unsigned i = 0; i < input.nb_streams; ++i) {
+        SoundForm form;
+        if (ReadSoundForm(*input.streams[i], form)) {
+            const int stream = static_cast<int>(i);
+            forms[stream] = form;
+            if (form.bitsPerChannel == 0) {
+                compressed.push_back(stream);
+            }
         }
     }
-    out = form;
-    return true;
+    for (const auto& [stream, decoded] : DecodeFirstSounds(path, compressed)) {
+        Deliver(decoded, *input.streams[stream]->codecpar, hasWholeIndex, forms[stream]);
+    }
+    return forms;
 }
 
 }  // namespace host

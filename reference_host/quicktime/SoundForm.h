@@ -3,6 +3,7 @@
 #pragma once
 
 #include <filesystem>
+#include <map>
 
 #include "host_interfaces/framework/Types.h"
 #include "reference_host/quicktime/AvOwners.h"
@@ -18,7 +19,8 @@ struct SoundForm {
     ncfUInt32 bytesPerPacket = 0;   // linear: a frame of all channels; 0: it varies
     ncfUInt32 framesPerPacket = 0;  // 0: it varies
     ncfUInt32 bitsPerChannel = 0;   // 0 for compressed sound
-    int decodedPerPacket = 0;       // frames that come out of each; 0: it varies
+    int decodedPerPacket =
+        0;  // frames out of each, by the first ones; 0: it varies, or is not known
     bool isBigEndian = false;
     bool isConstantBitRate = false;
     bool isStoredPlain = false;  // linear, and the file holds frame after frame
@@ -28,11 +30,12 @@ struct SoundForm {
 // make no sense.
 bool ReadSoundForm(const AVStream& stream, SoundForm& out);
 
-// As it is delivered: channels and rate of compressed sound are those that come
-// out of its decoder. But where a movie's header can be read by itself,
-// `hasWholeIndex`, an extension of AAC that it does not announce does not count:
-// nobody could tell of it who does not decode.
-bool ReadSoundForm(const std::filesystem::path& path, const AVStream& stream, bool hasWholeIndex,
-                   SoundForm& out);
+// All sound of a movie as it is delivered, by stream: channels and rate of
+// compressed sound are those that come out of its decoder. But where a movie's
+// header can be read by itself, as `hasWholeIndex` says, the rate is what it tells:
+// by the configuration of AAC, and by the fields of MPEG audio. Nobody could tell
+// of another who does not decode.
+std::map<int, SoundForm> ReadSoundForms(const std::filesystem::path& path,
+                                        const AVFormatContext& input, bool hasWholeIndex);
 
 }  // namespace host

@@ -47,14 +47,11 @@ SoundPlaces::SoundPlaces(const AVStream& stream, ncfSInt64 framesPerPacket, int 
     }
 }
 
-std::optional<ncfSInt64> SoundPlaces::Of(ncfSInt64 decodeTime) const {
-    const auto found = std::lower_bound(
+std::optional<SoundPlaces::Packet> SoundPlaces::LastAt(ncfSInt64 decodeTime) const {
+    const auto behind = std::upper_bound(
         packets_.begin(), packets_.end(), decodeTime,
-        [](const Packet& packet, ncfSInt64 wanted) { return packet.time < wanted; });
-    if (found == packets_.end() || found->time != decodeTime) {
-        return std::nullopt;
-    }
-    return found->place;
+        [](ncfSInt64 wanted, const Packet& packet) { return wanted < packet.time; });
+    return behind == packets_.begin() ? std::nullopt : std::optional<Packet>(*std::prev(behind));
 }
 
 ncfSInt64 SoundPlaces::TimeOf(ncfSInt64 place) const {

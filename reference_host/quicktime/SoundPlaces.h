@@ -17,20 +17,21 @@ namespace host {
 // more than rounding.
 class SoundPlaces {
 public:
-    // From the index of an input whose packets all hold `framesPerPacket`.
-    SoundPlaces(const AVStream& stream, ncfSInt64 framesPerPacket, int rate, ncfSInt64 zeroTime);
-
-    std::optional<ncfSInt64> Of(ncfSInt64 decodeTime) const;
-    // Decode time of the last packet that begins at `place` or before, of the
-    // first for none.
-    ncfSInt64 TimeOf(ncfSInt64 place) const;
-    bool IsEmpty() const { return packets_.empty(); }
-
-private:
     struct Packet {
         ncfSInt64 time;
         ncfSInt64 place;
     };
+    // From the index of an input whose packets all hold `framesPerPacket`.
+    SoundPlaces(const AVStream& stream, ncfSInt64 framesPerPacket, int rate, ncfSInt64 zeroTime);
+
+    // Decode time of the last packet that begins at `place` or before, of the
+    // first for none.
+    ncfSInt64 TimeOf(ncfSInt64 place) const;
+    bool IsEmpty() const { return packets_.empty(); }
+    // The last packet at this decode time or before; nothing before the first.
+    std::optional<Packet> LastAt(ncfSInt64 decodeTime) const;
+
+private:
     std::vector<Packet> packets_;
 };
 

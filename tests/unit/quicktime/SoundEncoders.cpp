@@ -54,6 +54,7 @@ const std::vector<SoundEncoder>& SoundEncoders() {
         {"DtsMp4", "-c:a dca -strict -2", ".mp4", 48000, 6},
         {"Mp2Mov", "-c:a mp2", ".mov"},
         {"Mp2Mp4", "-c:a mp2", ".mp4", 44100, 1},
+        {"Mp2Fixed", "-c:a mp2fixed", ".mov"},
         {"Twolame", "-c:a libtwolame", ".mp4"},
         {"Mp3Mov", "-c:a libmp3lame", ".mov"},
         {"Mp3Mp4", "-c:a libmp3lame", ".mp4", 44100, 1},
@@ -64,6 +65,10 @@ const std::vector<SoundEncoder>& SoundEncoders() {
         {"OpusMono", "-c:a libopus -b:a 24k", ".mp4", 48000, 1},
         {"VorbisMov", "-c:a libvorbis", ".mov"},
         {"VorbisMp4", "-c:a libvorbis", ".mp4", 44100, 1},
+        {"OpusNative", "-c:a opus -strict -2", ".mp4"},
+        {"VorbisNative", "-c:a vorbis -strict -2", ".mov"},
+        {"Nellymoser", "-c:a nellymoser", ".mov", 8000, 1},
+        {"Speex", "-c:a libspeex", ".mov", 8000, 1},
         {"Truehd", "-c:a truehd -strict -2", ".mp4"},
     };
     return encoders;

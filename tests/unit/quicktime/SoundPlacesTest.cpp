@@ -24,6 +24,12 @@ struct Indexed {
 
 constexpr AVRational kUnits48000{1, 48000};
 
+// Of the packet at just this time.
+std::optional<ncfSInt64> PlaceOf(const host::SoundPlaces& places, ncfSInt64 time) {
+    const auto packet = places.LastAt(time);
+    return packet && packet->time == time ? std::optional<ncfSInt64>(packet->place) : std::nullopt;
+}
+
 TEST(GapOfStep, IsNothingThatRoundingExplains) {
     // 1024 frames of 44100 are 1114.56 units.
     for (const ncfSInt64 step : {1113, 1114, 1115, 1116}) {
@@ -48,19 +54,22 @@ TEST(SoundPlaces, NeverLetRoundingAddUp) {
     const host::SoundPlaces places(*sound.stream, 1024, 44100, 0);
     ASSERT_FALSE(places.IsEmpty());
     for (ncfSInt64 i = 0; i < 1000; ++i) {
-        ASSERT_EQ(places.Of(i * 1115), i * 1024);
+        ASSERT_EQ(PlaceOf(places, i * 1115), i * 1024);
     }
-    EXPECT_EQ(places.Of(1116), std::nullopt);
+    // Between two packets it is the one before.
+    EXPECT_EQ(places.LastAt(1116)->time, 1115);
+    EXPECT_EQ(places.LastAt(2229)->time, 1115);
+    EXPECT_FALSE(places.LastAt(-1));
 }
 
 TEST(SoundPlaces, KeepAGapAndWhatPrimes) {
     const Indexed sound(kUnits48000, {-1115, 0, 1115, 1115 + 4800, 1115 + 4800 + 1114});
     const host::SoundPlaces places(*sound.stream, 1024, 44100, 0);
-    EXPECT_EQ(places.Of(-1115), -1024);
-    EXPECT_EQ(places.Of(0), 0);
-    EXPECT_EQ(places.Of(1115), 1024);
-    EXPECT_EQ(places.Of(1115 + 4800), 1024 + 4410);
-    EXPECT_EQ(places.Of(1115 + 4800 + 1114), 1024 + 4410 + 1024);
+    EXPECT_EQ(PlaceOf(places, -1115), -1024);
+    EXPECT_EQ(PlaceOf(places, 0), 0);
+    EXPECT_EQ(PlaceOf(places, 1115), 1024);
+    EXPECT_EQ(PlaceOf(places, 1115 + 4800), 1024 + 4410);
+    EXPECT_EQ(PlaceOf(places, 1115 + 4800 + 1114), 1024 + 4410 + 1024);
 }
 
 TEST(SoundPlaces, TellTheTimeOfThePacketAtAPlace) {

@@ -1,0 +1,78 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/quicktime/DecodedSound.h"
+
+#include <gtest/gtest.h>
+
+#include <ctime>
+#include <numeric>
+
+#include "tests/unit/quicktime/MadeMovie.h"
+
+using namespace quicktime_tests;
+
+namespace {
+
+std::vector<int> Streams(int count) {
+    std::vector<int> streams(static_cast<std::size_t>(count));
+    std::iota(streams.begin(), streams.end(), 0);
+    return streams;
+}
+
+// A movie of that many tracks of the same sound.
+MadeMovie TracksOf(int count, const std::string& form) {
+    std::string maps;
+    for (int i = 0; i < count; ++i) {
+        maps += "-map 1 ";
+    }
+    const MadeMovie one("-f lavfi -i sine=440:d=0.5:r=44100 " + form, ".mov");
+    return MadeMovie("-i " + one.Path().string() + " -i " + one.Path().string() + " " + maps +
+                     "-c copy");
+}
+
+double SecondsToHear(const MadeMovie& movie, int count) {
+    const std::clock_t start = std::clock();
+    const auto told = host::DecodeFirstSounds(movie.Path(), Streams(count));
+    EXPECT_EQ(told.size(), static_cast<std::size_t>(count));
+    for (const auto& [stream, sound] : told) {
+        EXPECT_EQ(sound.channels, 1) << stream;
+        EXPECT_EQ(sound.rate, 44100) << stream;
+        EXPECT_EQ(sound.framesPerPacket, 1152) << stream;
+    }
+    return static_cast<double>(std::clock() - start) / CLOCKS_PER_SEC;
+}
+
+// Four times the tracks take four times as long, and not sixteen times.
+TEST(DecodedSound, OfManyTracksTakesTimeThatGrowsWithTheirNumber) {
+    NEEDS_FFMPEG();
+    const std::string form = "-ac 1 -c:a libmp3lame";
+    const MadeMovie some = TracksOf(100, form);
+    const MadeMovie many = TracksOf(400, form);
+    SecondsToHear(some, 100);  // warms up
+    const double shorter = SecondsToHear(some, 100);
+    const double longer = SecondsToHear(many, 400);
+    RecordProperty("hundred", std::to_string(shorter));
+    RecordProperty("four_hundred", std::to_string(longer));
+    EXPECT_LT(longer, 10 * shorter + 0.05) << shorter << " and " << longer;
+}
+
+TEST(DecodedSound, IsToldOfStreamsThatAreAskedFor) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie(
+        "-f lavfi -i testsrc=d=0.5:s=64x64 -f lavfi -i sine=440:d=0.5:r=44100 "
+        "-f lavfi -i sine=440:d=0.5:r=22050 -map 0 -map 1 -map 2 -c:v mpeg4 -c:a:0 aac -ac:a:0 2 "
+        "-c:a:1 libmp3lame -ac:a:1 1");
+    const auto both = host::DecodeFirstSounds(movie.Path(), {1, 2});
+    ASSERT_EQ(both.size(), 2u);
+    EXPECT_EQ(both.at(1).channels, 2);
+    EXPECT_EQ(both.at(1).rate, 44100);
+    EXPECT_EQ(both.at(1).framesPerPacket, 1024);
+    EXPECT_EQ(both.at(2).channels, 1);
+    EXPECT_EQ(both.at(2).rate, 22050);
+    EXPECT_EQ(host::DecodeFirstSounds(movie.Path(), {2}).size(), 1u);
+    EXPECT_TRUE(host::DecodeFirstSounds(movie.Path(), {-1, 3}).empty());
+    EXPECT_TRUE(host::DecodeFirstSounds(movie.Path(), {}).empty());
+    EXPECT_TRUE(host::DecodeFirstSounds("missing.mov", {0}).empty());
+}
+
+}  // namespace
