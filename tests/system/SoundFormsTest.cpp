@@ -48,11 +48,12 @@ protected:
         return {Fact(sounds[0], "Channels"), Fact(sounds[0], "AudioSamplingRate"),
                 Fact(sounds[0], "Length")};
     }
-    // All that is delivered; the form is held against the description.
+    // All that is delivered of the sound, which is the last track; the form is held
+    // against the description.
     EssenceBytes Delivered(const std::filesystem::path& movie) {
         const Said said = Described(movie);
         Essence essence(session(), movie);
-        SoundReader reader(essence, essence.tracks().at(0));
+        SoundReader reader(essence, essence.tracks().back());
         EXPECT_EQ(std::to_string(reader.form().channels), said.channels);
         EXPECT_EQ(std::to_string(reader.form().rate) + "/1", said.rate);
         EXPECT_EQ(std::to_string(reader.Count()), said.length);
@@ -261,6 +262,115 @@ TEST_F(SoundForms, OfExtensionsOfAacThatNothingAnnouncesAreThoseOfTheCore) {
     }
     EXPECT_NEAR(rises, 440, 1);
     ExpectRangesOf(movie, got);
+}
+
+// Other tracks do not count, though to describe a picture like this one the
+// library reads on, and then knows more of the sound as well.
+TEST_F(SoundForms, OfTheCoreStayWhereAPictureIsReadBefore) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=2:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = WithEmptyBandExtension(SoundPacketsOf(plain));
+    const auto alone = WriteSound(
+        SoundTrackOf(packets, Mpeg4Sound(0x40, {0x13, 0x88}, 1, 22050), 22050, 1024), "alone.mov");
+    const auto both = Make("-f lavfi -i testsrc=d=2:r=25:s=64x64 -i " + Quoted(alone) +
+                               " -map 0:v -map 1:a -c:v mpeg4 -c:a copy",
+                           "both.mov");
+    const Said said = Described(both);
+    EXPECT_EQ(said.rate, "22050/1");
+    EXPECT_EQ(said.channels, "1");
+    EXPECT_GT(Delivered(both).size(), 2u * 22050 * 3 * 9 / 10);
+}
+
+// The fields of a description say a rate that its packets do not have: from the
+// first block on they are brought to it.
+TEST_F(SoundForms, HaveTheRateOfTheFieldsWhateverThePacketsHave) {
+    const auto plain = Make(kHum + std::string("44100 -ac 1 -c:a libmp3lame -write_xing 0 "
+                                               "-id3v2_version 0"),
+                            "plain.mp3");
+    movies::SoundFormat format;
+    format.codec = ".mp3";
+    format.channels = 1;
+    format.rate = 48000;
+    const SoundPackets packets = SoundPacketsOf(plain);
+    const auto movie = WriteSound(SoundTrackOf(packets, format, 44100, 1152), "other.mov");
+    const Said said = Described(movie);
+    EXPECT_EQ(said.rate, "48000/1");
+    const double seconds = static_cast<double>(packets.size()) * 1152 / 44100;
+    EXPECT_EQ(said.length, std::to_string(InEditUnits(seconds, 48000)));
+    const EssenceBytes got = Delivered(movie);
+    const auto rises = [&](std::size_t from, std::size_t to) {
+        int count = 0;
+        for (std::size_t i = from; i + 1 < to; ++i) {
+            const auto high = [&](std::size_t at) {
+                return static_cast<signed char>(got.at(at * 3 + 2));
+            };
+            count += high(i) < 0 && high(i + 1) >= 0;
+        }
+        return count;
+    };
+    EXPECT_NEAR(rises(4800, 4800 + 24000), 220, 1);
+    ExpectRangesOf(movie, got);
+}
+
+// The decoder makes 44100 of what is described with 22050, and a second is left
+// out in the middle.
+TEST_F(SoundForms, KeepAGapWhileTheRateIsConverted) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=2:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = WithEmptyBandExtension(SoundPacketsOf(plain));
+    const movies::SoundFormat format = Mpeg4Sound(0x40, {0x13, 0x88}, 1, 22050);
+    movies::Track track = SoundTrackOf(packets, format, 22050, 1024);
+    track.samples[8].duration += 22050;
+    const EssenceBytes got = Delivered(WriteSound(track, "gap.mov"));
+    const auto isSilent = [&](std::size_t from, std::size_t to) {
+        return std::all_of(got.begin() + static_cast<std::ptrdiff_t>(from * 3),
+                           got.begin() + static_cast<std::ptrdiff_t>(to * 3),
+                           [](auto byte) { return byte == 0; });
+    };
+    ASSERT_GT(got.size(), 3u * (22050 + 20 * 1024));
+    EXPECT_FALSE(isSilent(8 * 1024, 9 * 1024 - 100));
+    EXPECT_TRUE(isSilent(9 * 1024 + 100, 9 * 1024 + 22050 - 100));
+    EXPECT_FALSE(isSilent(9 * 1024 + 22050 + 100, 10 * 1024 + 22050));
+    EXPECT_FALSE(isSilent(18 * 1024 + 22050, 19 * 1024 + 22050));
+}
+
+// The edit begins within a packet: what is left of that one is followed by the
+// next as it is in the whole.
+TEST_F(SoundForms, AreContinuousFromAnEditWithinAPacket) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=3:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = SoundPacketsOf(plain);
+    const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
+    const EssenceBytes whole =
+        Delivered(WriteSound(SoundTrackOf(packets, format, 48000, 1115), "whole.mov"));
+    for (const std::int64_t start : {1500, 1800, 2230, 3000}) {
+        SCOPED_TRACE(start);
+        movies::Track track = SoundTrackOf(packets, format, 48000, 1115);
+        movies::Edit edit;
+        edit.duration = 2 * 44100;
+        edit.mediaTime = start;
+        track.edits = {edit};
+        const auto movie = WriteSound(track, "cut.mov");
+        const EssenceBytes got = Delivered(movie);
+        ASSERT_GE(got.size(), 40u * 1024 * 3);
+        // Behind the first packets, on which the start of decoding tells.
+        const auto piece = got.begin() + 6000 * 3;
+        const auto found = std::search(whole.begin(), whole.end(), piece, piece + 90);
+        ASSERT_NE(found, whole.end());
+        EXPECT_NEAR(static_cast<double>(found - whole.begin()) / 3 - 6000,
+                    static_cast<double>(start) * 44.1 / 48, 3);
+        const std::size_t count =
+            std::min<std::size_t>(static_cast<std::size_t>(got.end() - piece),
+                                  static_cast<std::size_t>(whole.end() - found));
+        EXPECT_TRUE(std::equal(piece, piece + static_cast<std::ptrdiff_t>(count), found));
+        const auto isHeard = [&](std::size_t i) {
+            return got[i * 3] || got[i * 3 + 1] || got[i * 3 + 2];
+        };
+        for (std::size_t i = 1000; i < 6000; ++i) {
+            EXPECT_TRUE(isHeard(i) || isHeard(i + 1)) << "a gap at " << i;
+        }
+        ExpectRangesOf(movie, got);
+    }
 }
 
 // A writer rounded the length of each packet, not its end: 1115 units of 48000
