@@ -122,9 +122,11 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
         OutputFile output(options.output);
         silent = SoundCopy(sound, header, output).Run(options.start, count);
         if (silent == count) {
-            throw Failure(kExitFile, options.movie,
-                          fmt::format("track {}: none of its samples from {} to {} could be read",
-                                      track.number, options.start, options.start + count - 1));
+            essence.FailSamples(
+                track,
+                fmt::format("track {}: none of its samples from {} to {} could be read",
+                            track.number, options.start, options.start + count - 1),
+                NCF_OK, options.start + count - 1);
         }
         if (WavNeedsPadding(form, count)) {
             output.Write("", 1);

@@ -8,7 +8,6 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FrameRange.h"
 #include "reference_host/cliphost/FrameReader.h"
-#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/ParameterOptions.h"
@@ -82,8 +81,9 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
         if (result != NCF_OK) {
             ++failed;
             picture = {};  // its cell stays empty
-            Notice("cliphost: {}: frame {} could not be read: {}\n", DisplayPath(options.movie),
-                   frame, ResultText(result));
+            Problem problem = essence.WhyUnread(track, frame, result);
+            problem.reason = fmt::format("frame {} stays empty: {}", frame, problem.reason);
+            TellProblem(problem, essence.session().verbosity());
         }
         sheet.Add(Turned(std::move(picture), turn));
     }

@@ -22,11 +22,19 @@ void Finish(Session& session, Description& description) {
 }  // namespace
 
 Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRESULT result) {
-    session.TakeNotices();
-    for (const std::filesystem::path& file : session.MissingDataFiles()) {
-        return {file, "this data file is missing", "put it back beside the module", result};
+    const std::vector<std::string> notices = session.TakeNotices();
+    Problem problem = DiagnoseMovie(movie, notices);
+    if (!problem) {
+        problem.subject = movie;
+        problem.reason = "the module makes no description of it, and no more is known of why";
+        problem.hint = "-vv shows what it logs";
+        // The module reads its data files at the first picture of a clip that loads.
+        for (const std::filesystem::path& file : session.MissingDataFiles()) {
+            problem.subject = file;
+            problem.reason = "this data file is missing";
+            problem.hint = "put it back beside the module";
+        }
     }
-    Problem problem = DiagnoseMovie(movie);
     problem.code = result;
     return problem;
 }

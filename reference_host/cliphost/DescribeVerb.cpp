@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
@@ -30,6 +31,14 @@ struct DescribeOptions {
     bool json = false;
     bool quiet = false;
 };
+
+void TellRoute(const std::filesystem::path& movie) {
+    const RouteTaken taken = RouteOf(movie);
+    if (!taken.reason.empty()) {
+        Notice("{}: read by the multimedia library, since the header parser refuses it: {}\n",
+               DisplayPath(movie), taken.reason);
+    }
+}
 
 // Describes all that the command line names; one bad movie stops nothing.
 class DescribeRun {
@@ -140,6 +149,9 @@ void DescribeRun::Take(const Description& description) {
         shown = isDevice ? shown : session_.aaf().Open(saved);
     }
     ++described_;
+    if (session_.verbosity() > 0) {
+        TellRoute(description.movie);
+    }
     if (OutputFile::IsStandardOutput(saved)) {
         return;  // what is shown would be in the midst of the file
     }
@@ -148,6 +160,11 @@ void DescribeRun::Take(const Description& description) {
         nlohmann::ordered_json entry = {{"movie", MachinePath(description.movie)}};
         if (!saved.empty()) {
             entry["aaf"] = MachinePath(saved);
+        }
+        const RouteTaken taken = RouteOf(description.movie);
+        entry["route"] = taken.route;
+        if (!taken.reason.empty()) {
+            entry["routeReason"] = taken.reason;
         }
         entry["description"] = nlohmann::ordered_json::parse(ToJson(tree));
         json_.push_back(std::move(entry));

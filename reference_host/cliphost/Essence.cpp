@@ -183,6 +183,36 @@ void Essence::Fail(const std::string& what, NCFRESULT result) const {
     throw Failure(kExitFile, Problem{movie_, what, {}, result});
 }
 
+void Essence::FailSamples(const ClipTrack& track, const std::string& what, NCFRESULT result,
+                          std::uint64_t sample) const {
+    Problem problem = DiagnoseSamples(movie_, Which(track), sample);
+    if (!problem) {
+        Fail(what, result);
+    }
+    problem.code = result;
+    throw Failure(kExitFile, std::move(problem));
+}
+
+Problem Essence::WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESULT result) const {
+    Problem problem = DiagnoseSamples(movie_, Which(track), sample);
+    problem.subject = movie_;
+    problem.code = result;
+    if (!problem) {
+        problem.reason = "it can't be decoded";
+    }
+    return problem;
+}
+
+// The alpha is part of the picture.
+WhichTrack Essence::Which(const ClipTrack& track) const {
+    WhichTrack which{track.kind};
+    for (const ClipTrack& other : tracks_) {
+        const bool isBefore = other.number < track.number && track.kind == TrackKind::Sound;
+        which.place += isBefore && other.kind == track.kind ? 1 : 0;
+    }
+    return which;
+}
+
 Essence OpenEssence(Session& session, const std::filesystem::path& movie,
                     const ParameterOptions& parameters) {
     Essence essence(session, movie, parameters);

@@ -10,6 +10,7 @@
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
+#include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Problem.h"
 #include "reference_host/cliphost/Session.h"
@@ -55,9 +56,17 @@ public:
     // Throws a Failure for a step that the module refused.
     [[noreturn]] void Fail(const std::string& what, NCFRESULT result) const;
 
+    // The same where the samples themselves may be the cause: it is told instead.
+    [[noreturn]] void FailSamples(const ClipTrack& track, const std::string& what, NCFRESULT result,
+                                  std::uint64_t sample = 0) const;
+    // Why a sample of a track could not be read; what is said where nothing but the
+    // decoder could tell.
+    Problem WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESULT result) const;
+
 private:
     void Map(NMA::IMediaContainer3& container);
     std::vector<ClipTrack> FindTracks();
+    WhichTrack Which(const ClipTrack& track) const;
 
     Session& session_;
     std::filesystem::path movie_;

@@ -28,8 +28,9 @@ Json PictureFormat(Essence& essence, const ClipTrack& track, const ImageFormat& 
         result = pictures.GetWorkingImageBufferRequirements(track.number, &alignment, &size);
     }
     if (result < 0) {
-        essence.Fail(fmt::format("track {}: format {} can't be set", track.number, format.index),
-                     result);
+        essence.FailSamples(
+            track, fmt::format("track {}: format {} can't be set", track.number, format.index),
+            result);
     }
     return {{"index", format.index},
             {"name", NameOf(format)},

@@ -18,7 +18,8 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     NMA::IUncompressedImageProvider& pictures = essence_.pictures();
     NCFRESULT result = pictures.SetWorkingImageFormat(track_.number, format_.index);
     if (result < 0) {
-        essence_.Fail(
+        essence_.FailSamples(
+            track_,
             fmt::format("track {}: the format {} can't be set", track_.number, NameOf(format_)),
             result);
     }
@@ -64,9 +65,7 @@ void FrameReader::Choose(const std::string& formatName) {
     }
     if (offered.empty()) {
         throw Failure(kExitFile, essence_.movie(),
-                      fmt::format("track {}: the module offers no format of it; its codec may be "
-                                  "unknown",
-                                  track_.number));
+                      fmt::format("track {}: the module offers no format of it", track_.number));
     }
     throw Failure(kExitCaller, essence_.movie(),
                   fmt::format("track {}: there is no format '{}'", track_.number, formatName),

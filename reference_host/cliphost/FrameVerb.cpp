@@ -121,8 +121,9 @@ void FrameRun::Write(std::uint64_t frame, FrameSink& sink) {
     if (result != NCF_OK) {
         ++failed_;
         essence_.session().TakeNotices();
-        Notice("cliphost: {}: track {}: frame {} is left out, it could not be read: {}\n",
-               DisplayPath(essence_.movie()), track_.number, frame, ResultText(result));
+        Problem problem = essence_.WhyUnread(track_, frame, result);
+        problem.reason = fmt::format("frame {} is left out: {}", frame, problem.reason);
+        TellProblem(problem, essence_.session().verbosity());
         return;
     }
     sink.Take(frame, reader_, alpha_.get());

@@ -5,141 +5,239 @@
 
 #include <fmt/format.h>
 
-#include <array>
-#include <cstring>
-#include <fstream>
+#include <algorithm>
+#include <iterator>
 #include <optional>
-#include <set>
 
+#include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/header_parser/InspectHeaders.h"
+#include "reference_host/header_parser/Verdict.h"
 #include "reference_host/quicktime/OpenProblem.h"
 
 namespace cliphost {
 namespace {
 
-// What the top level of the file holds.
-struct TopLevel {
-    std::set<std::string> atoms;
-    std::string cutAtom;  // the atom that is longer than the file, if any
-    bool isFamily = false;
-};
+using header_parser::Code;
+using header_parser::Counted;
+using header_parser::HeaderReport;
+using header_parser::Track;
 
-bool IsFourCharacters(const char* type) {
-    for (int i = 0; i < 4; ++i) {
-        const auto c = static_cast<unsigned char>(type[i]);
-        if (c < 0x20 || c == 0x7F) {
-            return false;
-        }
-    }
-    return true;
+// Lines that the module writes on its console when it can't describe a movie.
+constexpr const char* kNoRate = "The frame rate of the movie can't be determined.";
+constexpr const char* kNoLength = "The length of the movie can't be determined.";
+constexpr const char* kNoTracks = "Movie doesn't contain any video/audio tracks!";
+
+constexpr const char* kCopyAgain = "copy the file again from where it came";
+
+constexpr ncfUInt32 kEncrypted[] = {Code("encv"), Code("enca"), Code("drmi"), Code("drms")};
+
+bool HasSaid(const std::vector<std::string>& notices, const char* line) {
+    return std::find(notices.begin(), notices.end(), line) != notices.end();
 }
 
-TopLevel ReadTopLevel(std::ifstream& stream, std::uint64_t size) {
-    static constexpr std::array kFamily = {"ftyp", "moov", "mdat", "wide", "free",
-                                           "skip", "pnot", "moof", "styp", "uuid"};
-    TopLevel top;
-    std::uint64_t position = 0;
-    while (position + 8 <= size && top.atoms.size() < 64) {
-        std::array<unsigned char, 16> head{};
-        stream.seekg(static_cast<std::streamoff>(position));
-        stream.read(reinterpret_cast<char*>(head.data()), 16);
-        stream.clear();
-        std::uint64_t length = 0;
-        for (int i = 0; i < 4; ++i) {
-            length = length << 8 | head[static_cast<std::size_t>(i)];
-        }
-        const char* const type = reinterpret_cast<const char*>(head.data()) + 4;
-        if (!IsFourCharacters(type)) {
-            break;
-        }
-        const std::string name(type, 4);
-        if (position == 0) {
-            for (const char* const known : kFamily) {
-                top.isFamily = top.isFamily || name == known;
-            }
-        }
-        if (length == 1) {
-            length = 0;
-            for (int i = 8; i < 16; ++i) {
-                length = length << 8 | head[static_cast<std::size_t>(i)];
-            }
-        } else if (length == 0) {
-            length = size - position;
-        }
-        top.atoms.insert(name);
-        if (length > size - position) {
-            top.cutAtom = name;
-            break;
-        }
-        if (length < 8) {
-            break;
-        }
-        position += length;
+const std::vector<ncfUInt32>& TracksOf(const HeaderReport& header, TrackKind kind) {
+    return header.movie->Of(kind == TrackKind::Sound ? header_parser::TrackKind::kSound
+                                                     : header_parser::TrackKind::kVideo);
+}
+
+// Why the module takes no clip from a header that the parser understands.
+std::string WhyOfNoUse(const HeaderReport& header) {
+    const std::vector<ncfUInt32>& pictures = TracksOf(header, TrackKind::Picture);
+    if (pictures.empty() && TracksOf(header, TrackKind::Sound).empty()) {
+        return fmt::format("the movie holds no picture and no sound in its {}",
+                           Counted(header.movie->tracks.size(), "track"));
     }
-    return top;
+    if (!pictures.empty() && header.movie->tracks[pictures.front()].descriptionCount == 0) {
+        return fmt::format("track {} of the file: 'stsd' describes none of its samples",
+                           pictures.front() + 1);
+    }
+    return {};
+}
+
+// How often the pictures of the first track follow each other.
+std::string RateWords(const HeaderReport& header) {
+    const ncfUInt32 place = TracksOf(header, TrackKind::Picture).front();
+    const Track& track = header.movie->tracks[place];
+    const double seconds = track.mediaTimeScale == 0
+                               ? 0
+                               : static_cast<double>(track.mediaDuration) / track.mediaTimeScale;
+    return fmt::format("track {} of the file: {} in {:.0f} seconds come to no rate of frames",
+                       place + 1, Counted(track.samples.Count(), "picture"), seconds);
+}
+
+Problem WithoutRate(const std::filesystem::path& movie, const HeaderReport& header) {
+    if (!header.movie || TracksOf(header, TrackKind::Picture).empty()) {
+        return {movie, "nothing tells its rate of frames"};
+    }
+    Problem problem{movie, RateWords(header)};
+    const std::vector<ncfUInt32>& sounds = TracksOf(header, TrackKind::Sound);
+    if (!sounds.empty() && !header.movie->tracks[sounds.front()].sound.empty()) {
+        problem.hint =
+            fmt::format("the sound alone can be had: cliphost audio FILE --rate {:.0f} -o FILE.wav",
+                        header.movie->tracks[sounds.front()].sound.front().rate);
+    }
+    return problem;
+}
+
+bool IsInFile(const Track& track) {
+    return !track.isInFile.empty() &&
+           std::find(track.isInFile.begin(), track.isInFile.end(), false) == track.isInFile.end();
+}
+
+// Which samples of a track the file is too short for, where `sample` is one of
+// them. Samples follow each other in the file.
+std::string WhatIsMissing(const HeaderReport& header, std::size_t place, std::uint64_t sample) {
+    const Track& track = header.movie->tracks[place];
+    const auto isThere = [&](ncfUInt32 i) {
+        return track.samples.PositionOf(i) + track.samples.Sizes().SizeOf(i) <= header.fileSize;
+    };
+    const ncfUInt32 count = track.samples.Count();
+    if (count == 0 || !IsInFile(track) || isThere(count - 1)) {
+        return {};
+    }
+    ncfUInt32 first = 0;  // that is missing
+    for (ncfUInt32 end = count - 1; first < end;) {
+        const ncfUInt32 middle = first + (end - first) / 2;
+        isThere(middle) ? first = middle + 1 : end = middle;
+    }
+    if (sample < first) {
+        return {};
+    }
+    const ncfUInt64 begin = track.samples.PositionOf(0);
+    if (begin >= header.fileSize) {
+        return fmt::format(
+            "track {} of the file: its samples begin at byte {}, the file ends at byte {}",
+            place + 1, begin, header.fileSize);
+    }
+    return fmt::format(
+        "track {} of the file: the file ends at byte {}, so samples {} to {} of its table are "
+        "missing or cut off",
+        place + 1, header.fileSize, first, count - 1);
+}
+
+// The same of the first track that misses some.
+std::string WhatIsMissing(const HeaderReport& header) {
+    for (std::size_t i = 0; i < header.movie->tracks.size(); ++i) {
+        const ncfUInt32 count = header.movie->tracks[i].samples.Count();
+        if (const std::string missing = WhatIsMissing(header, i, count); !missing.empty()) {
+            return missing;
+        }
+    }
+    return {};
+}
+
+Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& header,
+                     const std::vector<std::string>& notices) {
+    if (HasSaid(notices, kNoRate)) {
+        return WithoutRate(movie, header);
+    }
+    if (HasSaid(notices, kNoLength)) {
+        return {movie,
+                fmt::format("its length of {} in {} a second comes to no frame",
+                            Counted(header.movie->duration, "unit"), header.movie->timeScale)};
+    }
+    if (const std::string missing = WhatIsMissing(header); !missing.empty()) {
+        return {movie, missing, kCopyAgain};
+    }
+    return {};
+}
+
+Problem OfSecondRoute(const std::filesystem::path& movie, const std::string& refusal,
+                      const std::vector<std::string>& notices) {
+    const char* const found = HasSaid(notices, kNoTracks) ? "no picture and no sound is found in it"
+                              : HasSaid(notices, kNoRate) ? "nothing tells its rate of frames"
+                              : HasSaid(notices, kNoLength) ? "no length is found in it"
+                                                            : nullptr;
+    if (!found) {
+        return {};
+    }
+    return {movie, fmt::format("{}; read by the multimedia library, {}", refusal, found)};
+}
+
+RouteTaken RouteOf(const HeaderReport& header) {
+    const std::string refused = header.movie ? WhyOfNoUse(header) : header.refusal.Sentence();
+    return {refused.empty() ? route::kHeader : route::kLibrary, refused};
 }
 
 }  // namespace
 
-Problem DiagnoseMovie(const std::filesystem::path& movie) {
-    std::error_code error;
-    const auto status = std::filesystem::status(movie, error);
-    if (std::filesystem::is_directory(status)) {
-        return {movie, "this is a folder", "give a movie in it"};
+Problem DiagnoseMovie(const std::filesystem::path& movie, const std::vector<std::string>& notices) {
+    if (Problem problem = WhyUnreadable(movie)) {
+        return problem;
     }
-    // A pipe would keep us waiting.
-    if (std::filesystem::exists(status) && !std::filesystem::is_regular_file(status)) {
-        return {movie, "this is no file but a pipe or device",
-                "copy what comes from it into a file"};
+    const HeaderReport header = header_parser::InspectHeaders(movie);
+    const std::string ofNoUse = RouteOf(header).reason;
+    if (ofNoUse.empty()) {
+        Problem problem = OfFirstRoute(movie, header, notices);
+        problem.route = route::kHeader;
+        return problem;
     }
-    const std::uintmax_t size = std::filesystem::file_size(movie, error);
-    std::ifstream stream(movie, std::ios::binary);
-    if (error || !stream) {
-        return {movie, "the file can't be read", "look at its permissions"};
-    }
-    if (size == 0) {
-        return {movie, "the file is empty", "copy it again from where it came"};
-    }
-    const TopLevel top = ReadTopLevel(stream, size);
     const std::string opening = host::OpenProblem(movie);
-    const char* const way = opening.empty() ? route::kLibrary : route::kNone;
-    const auto because = [&](std::string reason, std::string hint) {
-        return Problem{movie, std::move(reason), std::move(hint), NCF_OK, way};
-    };
-    if (!top.isFamily && !opening.empty()) {
-        return because(
-            fmt::format("the file is no movie of the QuickTime family, and can't be opened as "
-                        "another kind of movie, sound or picture either ({})",
-                        opening),
-            "convert it to .mov or .mp4");
-    }
-    if (top.isFamily && top.cutAtom == "moov") {
-        return because(fmt::format("the movie header is cut off at {} bytes", size),
-                       "copy the file again");
-    }
-    if (top.isFamily && top.atoms.count("moov") == 0) {
-        return top.cutAtom.empty()
-                   ? because("the file holds no movie header ('moov'), so nothing tells its tracks",
-                             {})
-                   : because(
-                         fmt::format("the file ends inside its '{}' atom, before any movie header",
-                                     top.cutAtom),
-                         "copy it again");
-    }
-    if (opening.empty() && top.atoms.count("moof") > 0) {
-        return because("the movie is fragmented, and nothing of use is in its fragments",
-                       "make it again from where it came");
+    Problem problem{movie, ofNoUse};
+    problem.route = route::kNone;
+    if (header.movie) {
+        return problem;
     }
     if (opening.empty()) {
-        return because(
-            "the file can be opened, but it holds neither picture nor sound, or its length is not "
-            "above 0, or it is longer than the 24 hours that its timecode can count",
-            {});
+        problem = OfSecondRoute(movie, ofNoUse, notices);
+        problem.route = route::kLibrary;
+        if (header.refusal.code == NMA_E_NODATA) {
+            problem.hint = kCopyAgain;
+        }
+        return problem;
     }
-    return because(
-        fmt::format("the movie header can't be used: {}; nor can it be read another way: {}",
-                    header_parser::InspectHeaders(movie).refusal.Sentence(), opening),
-        {});
+    // What begins with no atom of the family may be anything.
+    const bool isForeign = header.refusal.offset == 0u && header.refusal.atom.empty();
+    if (isForeign) {
+        problem.reason += fmt::format(
+            ", and the file can't be opened as another kind of movie, sound or picture either: {}",
+            opening);
+        problem.hint = "convert it to .mov or .mp4";
+    } else if (header.refusal.code == NMA_E_NODATA) {
+        problem.hint = kCopyAgain;
+    } else if (header.refusal.code == NCF_E_NOTSUPPORTED && opening != header.refusal.reason) {
+        problem.reason += "; nor can the multimedia library read it: " + opening;
+    }
+    return problem;
+}
+
+Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& which,
+                        std::uint64_t sample) {
+    const HeaderReport header = header_parser::InspectHeaders(movie);
+    const RouteTaken taken = RouteOf(header);
+    const auto because = [&](std::string reason, std::string hint) {
+        return Problem{movie, std::move(reason), std::move(hint), NCF_OK, taken.route};
+    };
+    const Track* track = nullptr;
+    std::size_t number = 0;
+    if (header.movie && which.place < TracksOf(header, which.kind).size()) {
+        number = TracksOf(header, which.kind)[which.place];
+        track = &header.movie->tracks[number];
+        const ncfUInt32 codec = !track->video.empty()   ? track->video.front().codec
+                                : !track->sound.empty() ? track->sound.front().codec
+                                                        : 0;
+        if (std::find(std::begin(kEncrypted), std::end(kEncrypted), codec) !=
+            std::end(kEncrypted)) {
+            return because(fmt::format("track {} of the file: its samples are encrypted ({})",
+                                       number + 1, header_parser::NameOf(codec)),
+                           "only who holds the key can read them");
+        }
+    }
+    const std::string decoder =
+        host::DecoderProblem(movie, which.kind == TrackKind::Sound, which.place);
+    if (!decoder.empty()) {
+        return because(decoder, "convert it with a program that knows this codec");
+    }
+    if (track) {
+        if (const std::string missing = WhatIsMissing(header, number, sample); !missing.empty()) {
+            return because(missing, kCopyAgain);
+        }
+    }
+    return {};
+}
+
+RouteTaken RouteOf(const std::filesystem::path& movie) {
+    return RouteOf(header_parser::InspectHeaders(movie));
 }
 
 }  // namespace cliphost

@@ -2,15 +2,41 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
+#include <string>
+#include <vector>
 
+#include "reference_host/cliphost/ClipTracks.h"
 #include "reference_host/cliphost/Problem.h"
 
 namespace cliphost {
 
 // Looks at a file that could not be described and says in a sentence what is
 // the matter with it and what would help. The module gives one code for all of
-// this; the bytes tell more.
-Problem DiagnoseMovie(const std::filesystem::path& movie);
+// this; what it told the user meanwhile, the header parser and the bytes tell
+// more. There is no reason, only a route, where the file is not the cause.
+Problem DiagnoseMovie(const std::filesystem::path& movie,
+                      const std::vector<std::string>& notices = {});
+
+// One of a movie's picture or sound tracks, counted from 0 among those of its
+// kind.
+struct WhichTrack {
+    TrackKind kind = TrackKind::Picture;
+    std::size_t place = 0;
+};
+
+// Why the samples of a track don't become frames or sound: encrypted, of a codec
+// without decoder, or not in the file from the given sample on. There is no
+// reason where the decoder alone could tell.
+Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& which,
+                        std::uint64_t sample = 0);
+
+// By which way a movie is read, and why not by the header parser where it refuses.
+struct RouteTaken {
+    const char* route;
+    std::string reason;  // empty on the first route
+};
+RouteTaken RouteOf(const std::filesystem::path& movie);
 
 }  // namespace cliphost

@@ -10,6 +10,7 @@
 
 #include "host_interfaces/util/NMALogger.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/QTParser.h"
@@ -135,8 +136,8 @@ host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
     std::error_code error;
     const std::filesystem::path absolute =
         std::filesystem::absolute(path, error).lexically_normal();
-    if (!error && !std::filesystem::exists(absolute, error)) {
-        throw Failure(kExitCaller, path, "there is no such file or folder");
+    if (Problem problem = WhyUnreachable(path)) {
+        throw Failure(kExitCaller, std::move(problem));
     }
     if (host::text::HoldsBackslash(absolute)) {
         throw Failure(kExitCaller, BackslashProblem(path));

@@ -56,8 +56,9 @@ SoundReader::Block SoundReader::Read(std::uint64_t first, std::uint64_t count) {
     request_->Ask(track_.number, first, count);
     const NCFRESULT result = essence_.provider().ProvideSampleRange(request_.get(), 0);
     if (result != NCF_OK || !request_->buffer().isComplete()) {
-        essence_.Fail(fmt::format("track {}: no sound from sample {}", track_.number, first),
-                      result < 0 ? result : NCF_E_FAIL);
+        essence_.FailSamples(track_,
+                             fmt::format("track {}: no sound from sample {}", track_.number, first),
+                             result < 0 ? result : NCF_E_FAIL);
     }
     Block block{request_->buffer().bytes(),
                 static_cast<std::size_t>(request_->buffer().validBytes()), false};

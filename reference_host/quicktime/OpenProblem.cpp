@@ -5,11 +5,42 @@
 
 #include "reference_host/quicktime/OpenInput.h"
 
+extern "C" {
+#include <libavcodec/avcodec.h>
+#include <libavutil/avutil.h>
+}
+
 namespace host {
 
 std::string OpenProblem(const std::filesystem::path& path) {
     std::string reason;
     return OpenInput(path, InputView::AsPresented, reason) ? std::string() : reason;
+}
+
+std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place) {
+    std::string reason;
+    const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
+    const AVMediaType wanted = ofSound ? AVMEDIA_TYPE_AUDIO : AVMEDIA_TYPE_VIDEO;
+    for (unsigned i = 0; input && i < input->nb_streams; ++i) {
+        const AVStream& stream = *input->streams[i];
+        if (stream.codecpar->codec_type != wanted ||
+            (stream.disposition & AV_DISPOSITION_ATTACHED_PIC) != 0) {
+            continue;
+        }
+        if (place-- > 0) {
+            continue;
+        }
+        if (avcodec_find_decoder(stream.codecpar->codec_id)) {
+            return {};
+        }
+        char code[AV_FOURCC_MAX_STRING_SIZE] = {};
+        av_fourcc_make_string(code, stream.codecpar->codec_tag);
+        const AVCodecDescriptor* const known = avcodec_descriptor_get(stream.codecpar->codec_id);
+        return "track " + std::to_string(i + 1) +
+               " of the file: no decoder is known for its codec '" + code + "'" +
+               (known ? std::string(", ") + known->long_name : std::string());
+    }
+    return {};
 }
 
 }  // namespace host

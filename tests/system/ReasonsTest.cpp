@@ -1,0 +1,187 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// The sentence that each failure is told with: what is wrong with the file, by
+// track and numbers, and what helps.
+
+#include <algorithm>
+#include <functional>
+#include <nlohmann/json.hpp>
+
+#include "tests/system/Command.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using Json = nlohmann::json;
+
+// Another code for the sample description of a codec, wherever it stands.
+movies::Bytes WithCode(movies::Bytes bytes, const std::string& from, const std::string& to) {
+    for (auto at = bytes.begin();;) {
+        at = std::search(at, bytes.end(), from.begin(), from.end());
+        if (at == bytes.end()) {
+            return bytes;
+        }
+        std::copy(to.begin(), to.end(), at);
+    }
+}
+
+movies::Movie OneTrack(movies::Track track) {
+    movies::Movie movie;
+    movie.header = movies::Place::kBeforeMedia;
+    movie.tracks.push_back(std::move(track));
+    return movie;
+}
+
+movies::Bytes Made(const char* name) {
+    return ReadFile(MadeMovie(name));
+}
+
+movies::Bytes CutAt(movies::Bytes bytes, std::size_t size) {
+    bytes.resize(size);
+    return bytes;
+}
+
+// Two pictures of an hour each beside sound.
+movies::Bytes TwoLongPictures() {
+    movies::Movie movie = OneTrack(movies::VideoTrack(movies::VideoFormat(), 2, 1, 3600));
+    movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 48000));
+    return movies::Build(movie).ToBytes();
+}
+
+movies::Bytes TimecodeAlone() {
+    return movies::Build(OneTrack(movies::TimecodeTrack(movies::TimecodeFormat(), 90000, 100)))
+        .ToBytes();
+}
+
+struct Case {
+    const char* name;
+    movies::Bytes (*make)();
+    std::string call;  // the movie's name follows
+    std::string words;
+};
+
+void PrintTo(const Case& row, std::ostream* out) {
+    *out << row.name;
+}
+
+class Reasons : public SystemTest {
+protected:
+    std::string In(const std::string& name) { return Quoted(folder() / name); }
+    std::string Line(const std::string& arguments) {
+        return RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
+                          " " + arguments + " 2>&1")
+            .out;
+    }
+};
+
+class ReasonOf : public Reasons, public testing::WithParamInterface<Case> {};
+
+TEST_P(ReasonOf, IsTold) {
+    Write(GetParam().make(), "a.mov");
+    const std::string said = Line(GetParam().call + " a.mov");
+    EXPECT_EQ(said.substr(0, said.find('\n')), GetParam().words) << said;
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Files, ReasonOf,
+    testing::Values(
+        Case{"ImpossibleSize",
+             [] {
+                 return movies::Bytes{0, 0, 0, 16, 'f', 't', 'y', 'p', 'q', 't', ' ', ' ',
+                                      0, 0, 0, 0,  0,   0,   0,   4,   'm', 'd', 'a', 't'};
+             },
+             "describe -q", "cliphost: a.mov: 'mdat' has the impossible size 4 (at byte 16)"},
+        Case{"NoPictureAndNoSound", TimecodeAlone, "describe -q",
+             "cliphost: a.mov: the movie holds no picture and no sound in its 1 track"},
+        Case{"LongPictures", TwoLongPictures, "describe -q",
+             "cliphost: a.mov: track 1 of the file: 2 pictures in 7200 seconds come to no rate of "
+             "frames; the sound alone can be had: cliphost audio FILE --rate 48000 -o FILE.wav"},
+        Case{"EncryptedPicture", [] { return WithCode(Made("png.mov"), "png ", "encv"); },
+             "frame -o o.png",
+             "cliphost: a.mov: track 1 of the file: its samples are encrypted "
+             "('encv'); only who holds the key can read them"},
+        Case{"PictureWithoutDecoder", [] { return WithCode(Made("png.mov"), "png ", "xyz1"); },
+             "frame -o o.png",
+             "cliphost: a.mov: track 1 of the file: no decoder is known for its codec 'xyz1'; "
+             "convert it with a program that knows this codec"},
+        Case{"FormatsWithoutDecoder", [] { return WithCode(Made("png.mov"), "png ", "xyz1"); },
+             "formats",
+             "cliphost: a.mov: track 1 of the file: no decoder is known for its codec 'xyz1'; "
+             "convert it with a program that knows this codec"}),
+    [](const auto& test) { return std::string(test.param.name); });
+
+TEST_F(Reasons, TellWhereTheMediaDataEnds) {
+    const std::string media = "mdat";
+    // With the header in front, a cut leaves it whole.
+    const auto front = folder() / "front.mov";
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -i " + Quoted(MadeMovie("png.mov")) +
+                         " -c copy -movflags +faststart " + Quoted(front))
+                  .status,
+              0);
+    const movies::Bytes bytes = ReadFile(front);
+    const auto found = std::search(bytes.begin(), bytes.end(), media.begin(), media.end());
+    const auto begin = static_cast<std::size_t>(found - bytes.begin()) + media.size();
+    Write(CutAt(bytes, begin), "none.mov");
+    ExpectSays(RunCliphost("frame -o " + In("o.png") + " " + In("none.mov")), 1,
+               "track 1 of the file: its samples begin at byte " + std::to_string(begin) +
+                   ", the file ends at byte " + std::to_string(begin) +
+                   "; copy the file again from where it came");
+    Write(CutAt(bytes, begin + 10), "few.mov");
+    ExpectSays(RunCliphost("frame -o " + In("o.png") + " " + In("few.mov")), 1,
+               "track 1 of the file: the file ends at byte " + std::to_string(begin + 10) +
+                   ", so samples 0 to ");
+    // What is damaged and not cut is not called missing.
+    movies::Bytes damaged = bytes;
+    std::fill(damaged.begin() + static_cast<std::ptrdiff_t>(begin), damaged.end(), 0);
+    Write(damaged, "damaged.mov");
+    ExpectSays(RunCliphost("frame -o " + In("o.png") + " " + In("damaged.mov")), 1,
+               "frame 0 is left out: it can't be decoded");
+}
+
+TEST_F(Reasons, TellWhereAWayEnds) {
+    std::filesystem::create_symlink("gone", folder() / "dangling.mov");
+    std::filesystem::create_symlink("loop.mov", folder() / "loop.mov");
+    Write(movies::Bytes(100, 'x'), "file.mov");
+    const std::string at = folder().string();
+    struct {
+        const char* path;
+        std::string words;
+    } const cases[] = {
+        {"absent.mov", "there is no such file or folder"},
+        {"no/folder/a.mov", "there is no such file or folder, and no folder " + at + "/no"},
+        {"file.mov/a.mov", at + "/file.mov is no folder"},
+        {"dangling.mov", "the link " + at +
+                             "/dangling.mov leads to gone, which is not there; make it lead to a "
+                             "file that is there"},
+        {"loop.mov", "the link " + at + "/loop.mov leads in a circle; make it lead to a file"},
+    };
+    for (const auto& each : cases) {
+        for (const char* const verb : {"describe", "formats", "samples", "audio -o o.wav"}) {
+            EXPECT_EQ(Line(std::string(verb) + " " + each.path),
+                      std::string("cliphost: ") + each.path + ": " + each.words + "\n");
+        }
+    }
+}
+
+// The header parser leaves fragmented movies to the multimedia library.
+TEST_F(Reasons, TellWhyAMovieIsReadTheSecondWay) {
+    const auto movie = std::filesystem::path(CLIPHOST_TYPE_FILES) / "fragmented.mp4";
+    const CommandResult json = RunCommand(Quoted(ProgramFolder() / "cliphost") +
+                                          " describe --json " + Quoted(movie) + " 2>/dev/null");
+    const Json entry = Json::parse(json.out);
+    const Json& one = entry.is_array() ? entry[0] : entry;
+    EXPECT_EQ(one["route"], "library");
+    EXPECT_NE(one["routeReason"].get<std::string>().find("fragmented"), std::string::npos);
+    ExpectSays(RunCliphost("-v describe -q " + Quoted(movie)), 0,
+               "read by the multimedia library, since the header parser refuses it: the movie is "
+               "fragmented");
+    const CommandResult first = RunCommand(Quoted(ProgramFolder() / "cliphost") +
+                                           " describe --json " + Quoted(MadeMovie("png.mov")));
+    const Json parsed = Json::parse(first.out);
+    const Json& other = parsed.is_array() ? parsed[0] : parsed;
+    EXPECT_EQ(other["route"], "header");
+    EXPECT_FALSE(other.contains("routeReason"));
+}
+
+}  // namespace
