@@ -5,6 +5,7 @@
 
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/PluginComponents.h"
+#include "reference_host/cliphost/DataFiles.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
 
 namespace cliphost {
@@ -25,15 +26,14 @@ Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRES
     const std::vector<std::string> notices = session.TakeNotices();
     Problem problem = DiagnoseMovie(movie, notices);
     if (!problem) {
-        problem.subject = movie;
-        problem.reason = "the module makes no description of it, and no more is known of why";
-        problem.hint = "-vv shows what it logs";
+        const std::string way = problem.route;
         // The module reads its data files at the first picture of a clip that loads.
-        for (const std::filesystem::path& file : session.MissingDataFiles()) {
-            problem.subject = file;
-            problem.reason = "this data file is missing";
-            problem.hint = "put it back beside the module";
+        problem = DataFileProblem(session);
+        if (!problem) {
+            problem = {movie, "the module makes no description of it, and no more is known of why",
+                       "-vv shows what it logs"};
         }
+        problem.route = way;
     }
     problem.code = result;
     return problem;

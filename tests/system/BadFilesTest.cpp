@@ -176,6 +176,28 @@ TEST_F(MissingData, IsNamed) {
     }
 }
 
+// Broken ones are told with the place, and with what the parser says.
+TEST_F(MissingData, IsToldFromBrokenData) {
+    for (const char* const name : {"FourCharMapper.xml", "AAFInfo.xml"}) {
+        SCOPED_TRACE(name);
+        const auto file = folder() / "plugins" / name;
+        const movies::Bytes whole = ReadFile(file);
+        const std::string broken = "<?xml version=\"1.0\"?>\n<a>\n  <b></a>\n";
+        Write(movies::Bytes(broken.begin(), broken.end()), std::string("plugins/") + name);
+        Start();
+        const cliphost::Description description =
+            cliphost::DescribeMovie(session(), MadeMovie("png.mov"));
+        EXPECT_LT(description.result, 0);
+        const std::string line = LineOf(description.problem);
+        EXPECT_TRUE(
+            Says(line, std::string(name) + ": this data file is broken, line 3, column 8: "))
+            << line;
+        EXPECT_EQ(description.problem.route, cliphost::route::kHeader);
+        Write(whole, std::string("plugins/") + name);
+        End();
+    }
+}
+
 TEST_F(MissingData, IsReadOnceItIsBack) {
     Remove("AAFInfo.xml");
     Start();
