@@ -123,6 +123,10 @@ Problem WhyUnlistable(const std::filesystem::path& folder) {
                 error == EACCES ? "get the right to read it" : ""};
     }
     closedir(list);
+    if (access(folder.c_str(), X_OK) != 0) {
+        return {folder, "the folder can't be entered: " + SystemText(errno),
+                "get the right to search it"};
+    }
     return {};
 }
 

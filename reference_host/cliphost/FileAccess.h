@@ -15,7 +15,7 @@ Problem WhyUnreachable(const std::filesystem::path& path);
 // device, closed by its permissions, or empty. Nothing when they can.
 Problem WhyUnreadable(const std::filesystem::path& file);
 
-// Why the entries of a folder can't be listed.
+// Why the entries of a folder can't be listed or looked at.
 Problem WhyUnlistable(const std::filesystem::path& folder);
 
 }  // namespace cliphost

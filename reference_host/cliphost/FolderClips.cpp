@@ -11,6 +11,7 @@
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/Paths.h"
@@ -82,6 +83,9 @@ std::string HowToName(const std::vector<std::filesystem::path>& movies) {
 }  // namespace
 
 OtherMovies FindOtherMovies(const std::filesystem::path& folder) {
+    if (Problem problem = WhyUnlistable(folder)) {
+        throw Failure(kExitCaller, std::move(problem));
+    }
     OtherMovies others;
     std::error_code error;
     std::filesystem::directory_iterator entry(folder, error);
@@ -98,7 +102,7 @@ OtherMovies FindOtherMovies(const std::filesystem::path& folder) {
         }
     }
     if (error) {
-        throw Failure(kExitCaller, folder, "the folder can't be read: " + error.message());
+        throw Failure(kExitCaller, folder, "the folder can't be listed: " + error.message());
     }
     std::sort(others.otherEnding.begin(), others.otherEnding.end());
     std::sort(others.withBackslash.begin(), others.withBackslash.end());

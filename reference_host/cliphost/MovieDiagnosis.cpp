@@ -126,6 +126,19 @@ std::string WhatIsMissing(const HeaderReport& header) {
     return {};
 }
 
+// Which track of those that a clip is made of holds nothing.
+std::string WhatIsEmpty(const HeaderReport& header) {
+    for (const TrackKind kind : {TrackKind::Picture, TrackKind::Sound}) {
+        if (!TracksOf(header, kind).empty()) {
+            const ncfUInt32 place = TracksOf(header, kind).front();
+            return header.movie->tracks[place].samples.Count() == 0
+                       ? fmt::format("track {} of the file: it holds no samples", place + 1)
+                       : std::string();
+        }
+    }
+    return {};
+}
+
 Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& header,
                      const std::vector<std::string>& notices) {
     if (HasSaid(notices, kNoRate)) {
@@ -135,6 +148,9 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
         return {movie,
                 fmt::format("its length of {} in {} a second comes to no frame",
                             Counted(header.movie->duration, "unit"), header.movie->timeScale)};
+    }
+    if (const std::string empty = WhatIsEmpty(header); !empty.empty()) {
+        return {movie, empty};
     }
     if (const std::string missing = WhatIsMissing(header); !missing.empty()) {
         return {movie, missing, kCopyAgain};

@@ -4,6 +4,8 @@
 // The sentence that each failure is told with: what is wrong with the file, by
 // track and numbers, and what helps.
 
+#include <unistd.h>
+
 #include <algorithm>
 #include <functional>
 #include <nlohmann/json.hpp>
@@ -94,6 +96,32 @@ INSTANTIATE_TEST_SUITE_P(
              "describe -q", "cliphost: a.mov: 'mdat' has the impossible size 4 (at byte 16)"},
         Case{"NoPictureAndNoSound", TimecodeAlone, "describe -q",
              "cliphost: a.mov: the movie holds no picture and no sound in its 1 track"},
+        Case{"NoSampleDescription",
+             [] {
+                 movies::Track track = movies::VideoTrack(movies::VideoFormat(), 0, 25, 1);
+                 track.descriptions.clear();
+                 return movies::Build(OneTrack(track)).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1 of the file: 'stsd' describes none of its samples"},
+        Case{"TooManyChannels",
+             [] {
+                 movies::SoundFormat format;
+                 format.channels = 600;
+                 movies::Movie movie = OneTrack(movies::SoundTrack(format, 480));
+                 movie.tracks.push_back(movies::SoundTrack(format, 480));
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: the sounds of the movie have more than 1024 channels together (at "
+             "byte 20)"},
+        Case{"NoSamples",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 0, 25, 1));
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q", "cliphost: a.mov: track 1 of the file: it holds no samples"},
         Case{"LongPictures", TwoLongPictures, "describe -q",
              "cliphost: a.mov: track 1 of the file: 2 pictures in 7200 seconds come to no rate of "
              "frames; the sound alone can be had: cliphost audio FILE --rate 48000 -o FILE.wav"},
@@ -162,6 +190,50 @@ TEST_F(Reasons, TellWhereAWayEnds) {
                       std::string("cliphost: ") + each.path + ": " + each.words + "\n");
         }
     }
+}
+
+// Root reads everything, so the program runs as another user then, where the
+// machine can do that and lets that user reach the program.
+TEST_F(Reasons, TellWhatPermissionsForbid) {
+    const std::string program = Quoted(ProgramFolder() / "cliphost");
+    const std::string other =
+        geteuid() == 0 ? "setpriv --reuid=65534 --regid=65534 --clear-groups " : "";
+    std::filesystem::permissions(folder(), std::filesystem::perms(0755));
+    std::filesystem::create_directory(folder() / "in");
+    const std::string in = (folder() / "in").string();
+    const std::string canRun = other + program + " --version && " + other + "ls " + Quoted(in);
+    if (RunCommand("(" + canRun + ") >/dev/null 2>&1").status != 0) {
+        GTEST_SKIP() << "no other user can run the program";
+    }
+    std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "in/a.mov");
+    const struct {
+        unsigned folder;
+        unsigned file;
+        const char* call;
+        std::string words;
+    } cases[] = {
+        {0755, 0000, "describe in/a.mov",
+         "in/a.mov: the file can't be opened: Permission denied; get the right to read it"},
+        {0000, 0644, "describe in/a.mov",
+         "in/a.mov: the folder " + in +
+             " can't be entered: Permission denied; get the right to search it"},
+        {0111, 0644, "scan in",
+         "in: the folder can't be listed: Permission denied; get the right to read it"},
+        {0444, 0644, "scan in",
+         "in: the folder can't be entered: Permission denied; get the right to search it"},
+        {0444, 0644, "describe in",
+         "in: the folder can't be entered: Permission denied; get the right to search it"},
+    };
+    for (const auto& each : cases) {
+        std::filesystem::permissions(folder() / "in", std::filesystem::perms(0755));
+        std::filesystem::permissions(folder() / "in/a.mov", std::filesystem::perms(each.file));
+        std::filesystem::permissions(folder() / "in", std::filesystem::perms(each.folder));
+        const CommandResult ran = RunCommand("cd " + Quoted(folder()) + " && " + other + program +
+                                             " " + each.call + " 2>&1");
+        EXPECT_EQ(ran.out, "cliphost: " + each.words + "\n");
+        EXPECT_EQ(ran.status, 2);
+    }
+    std::filesystem::permissions(folder() / "in", std::filesystem::perms(0755));
 }
 
 // The header parser leaves fragmented movies to the multimedia library.
