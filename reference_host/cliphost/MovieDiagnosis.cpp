@@ -65,18 +65,21 @@ std::string RateWords(const HeaderReport& header) {
                        place + 1, Counted(track.samples.Count(), "picture"), seconds);
 }
 
+// How the sound of a movie without description is had.
+std::string SoundHint(const HeaderReport& header) {
+    const std::vector<ncfUInt32>& sounds = TracksOf(header, TrackKind::Sound);
+    if (sounds.empty() || header.movie->tracks[sounds.front()].sound.empty()) {
+        return {};
+    }
+    return fmt::format("the sound alone can be had: cliphost audio FILE --rate {:.0f} -o FILE.wav",
+                       header.movie->tracks[sounds.front()].sound.front().rate);
+}
+
 Problem WithoutRate(const std::filesystem::path& movie, const HeaderReport& header) {
     if (!header.movie || TracksOf(header, TrackKind::Picture).empty()) {
         return {movie, "nothing tells its rate of frames"};
     }
-    Problem problem{movie, RateWords(header)};
-    const std::vector<ncfUInt32>& sounds = TracksOf(header, TrackKind::Sound);
-    if (!sounds.empty() && !header.movie->tracks[sounds.front()].sound.empty()) {
-        problem.hint =
-            fmt::format("the sound alone can be had: cliphost audio FILE --rate {:.0f} -o FILE.wav",
-                        header.movie->tracks[sounds.front()].sound.front().rate);
-    }
-    return problem;
+    return {movie, RateWords(header), SoundHint(header)};
 }
 
 bool IsInFile(const Track& track) {
@@ -147,7 +150,8 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
     if (HasSaid(notices, kNoLength)) {
         return {movie,
                 fmt::format("its length of {} in {} a second comes to no frame",
-                            Counted(header.movie->duration, "unit"), header.movie->timeScale)};
+                            Counted(header.movie->duration, "unit"), header.movie->timeScale),
+                SoundHint(header)};
     }
     if (const std::string empty = WhatIsEmpty(header); !empty.empty()) {
         return {movie, empty};
@@ -208,7 +212,8 @@ Problem DiagnoseMovie(const std::filesystem::path& movie, const std::vector<std:
         problem.reason += fmt::format(
             ", and the file can't be opened as another kind of movie, sound or picture either: {}",
             opening);
-        problem.hint = "convert it to .mov or .mp4";
+        problem.hint =
+            header.refusal.code == NMA_E_NODATA ? kCopyAgain : "convert it to .mov or .mp4";
     } else if (header.refusal.code == NMA_E_NODATA) {
         problem.hint = kCopyAgain;
     } else if (header.refusal.code == NCF_E_NOTSUPPORTED && opening != header.refusal.reason) {
