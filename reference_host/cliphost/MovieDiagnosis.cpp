@@ -71,8 +71,14 @@ std::string SoundHint(const HeaderReport& header) {
     if (sounds.empty() || header.movie->tracks[sounds.front()].sound.empty()) {
         return {};
     }
+    const Track& track = header.movie->tracks[sounds.front()];
+    // Without a description packets of several samples count as one.
+    if (track.samples.Count() != track.mediaDuration) {
+        return "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c copy "
+               "SOUND.mov";
+    }
     return fmt::format("the sound alone can be had: cliphost audio FILE --rate {:.0f} -o FILE.wav",
-                       header.movie->tracks[sounds.front()].sound.front().rate);
+                       track.sound.front().rate);
 }
 
 Problem WithoutRate(const std::filesystem::path& movie, const HeaderReport& header) {
