@@ -102,10 +102,12 @@ constexpr std::array<const char*, 5> kClaimWords = {
 
 class Walker {
 public:
-    // `fileLength`: of the file that the bytes come from.
-    Walker(Source& source, ncfUInt64 fileLength)
+    // `fileLength`: of the file that the bytes come from. `isPlain`: the bytes came
+    // out of a packed header, and none is packed twice.
+    Walker(Source& source, ncfUInt64 fileLength, bool isPlain)
         : source_(source),
           fileLength_(fileLength),
+          isPlain_(isPlain),
           limit_(std::max(fileLength, kClaimsAlwaysFine)) {}
 
     std::string Run() {
@@ -150,7 +152,9 @@ private:
                 ReadTrack(position, end, depth);
                 return;
             case Code("cmov"):
-                Unpack(position, end);
+                if (!isPlain_) {
+                    Unpack(position, end);
+                }
                 return;
             case Code("moov"):
             case Code("mdia"):
@@ -346,11 +350,12 @@ private:
             return;
         }
         MemorySource plain(std::move(bytes));
-        problem_ = Walker(plain, fileLength_).Run();
+        problem_ = Walker(plain, fileLength_, true).Run();
     }
 
     Source& source_;
     const ncfUInt64 fileLength_;
+    const bool isPlain_;
     const ncfUInt64 limit_;  // of the sums
     TrackTables tables_;
     ncfUInt32 timeScale_ = 0;
@@ -363,7 +368,7 @@ private:
 
 std::string FindImpossibleTable(const std::filesystem::path& path) {
     FileSource file(path);
-    return Walker(file, file.Length()).Run();
+    return Walker(file, file.Length(), false).Run();
 }
 
 }  // namespace host

@@ -209,7 +209,8 @@ TEST_F(EssenceProgram, TellsOfAFullDisk) {
 TEST_F(EssenceProgram, SaysOfABadFileWhatWouldHelp) {
     const auto cut =
         Write(movies::Bytes{0, 0, 0, 20, 'f', 't', 'y', 'p', 'q', 't', ' ', ' '}, "short.mov");
-    ExpectSays(RunCliphost("formats " + Quoted(cut)), 1, "copy it again");
+    ExpectSays(RunCliphost("formats " + Quoted(cut)), 1,
+               "'ftyp' claims 20 bytes, the file ends at byte 12");
 }
 
 TEST_F(EssenceProgram, PutsFramesFromAllThroughTheMovieOnASheet) {
