@@ -4,189 +4,24 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// The dictionary and the definitions that objects refer to.
+// Definitions that objects refer to.
 
 struct IAAFClassDef;
 struct IAAFCodecDef;
 struct IAAFContainerDef;
 struct IAAFDataDef;
 struct IAAFDefObject;
-struct IAAFDictionary;
-struct IAAFInterpolationDef;
 struct IAAFKLVDataDefinition;
-struct IAAFLocator;
-struct IAAFNetworkLocator;
-struct IAAFOperationDef;
-struct IAAFParameterDef;
-struct IAAFPluginDef;
 struct IAAFPropertyDef;
 struct IAAFTaggedValueDefinition;
 struct IAAFTypeDef;
-struct IEnumAAFClassDefs;
 struct IEnumAAFCodecDefs;
 struct IEnumAAFCodecFlavours;
 struct IEnumAAFContainerDefs;
 struct IEnumAAFDataDefs;
-struct IEnumAAFInterpolationDefs;
 struct IEnumAAFKLVDataDefs;
-struct IEnumAAFLoadedPlugins;
-struct IEnumAAFOperationDefs;
-struct IEnumAAFParameterDefs;
-struct IEnumAAFPluginDefs;
-struct IEnumAAFPluginLocators;
 struct IEnumAAFPropertyDefs;
 struct IEnumAAFTaggedValueDefs;
-struct IEnumAAFTypeDefs;
-
-// Answered by AAFDictionary.
-struct IAAFDictionary : IUnknown {
-    virtual HRESULT CreateInstance(aafUID_constref id, REFIID riid, IUnknown** object) = 0;  // 3
-    virtual HRESULT CreateMetaInstance(aafUID_constref id, REFIID riid,
-                                       IUnknown** metaDefinition) = 0;                     // 4
-    virtual HRESULT RegisterClassDef(IAAFClassDef* classDef) = 0;                          // 5
-    virtual HRESULT LookupClassDef(aafUID_constref classId, IAAFClassDef** classDef) = 0;  // 6
-    virtual HRESULT GetClassDefs(IEnumAAFClassDefs** enumerator) = 0;                      // 7
-    virtual HRESULT CountClassDefs(aafUInt32* result) = 0;                                 // 8
-    virtual HRESULT CreateForwardClassReference(aafUID_constref classId) = 0;              // 9
-    virtual HRESULT HasForwardClassReference(aafUID_constref classId,
-                                             aafBoolean_t* result) = 0;                      // 10
-    virtual HRESULT RegisterTypeDef(IAAFTypeDef* typeDef) = 0;                               // 11
-    virtual HRESULT LookupTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;        // 12
-    virtual HRESULT GetTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                          // 13
-    virtual HRESULT CountTypeDefs(aafUInt32* result) = 0;                                    // 14
-    virtual HRESULT RegisterOpaqueTypeDef(IAAFTypeDef* typeDef) = 0;                         // 15
-    virtual HRESULT LookupOpaqueTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;  // 16
-    virtual HRESULT GetOpaqueTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                    // 17
-    virtual HRESULT CountOpaqueTypeDefs(aafUInt32* result) = 0;                              // 18
-    virtual HRESULT RegisterKLVDataKey(aafUID_t uid, IAAFTypeDef* typeDef) = 0;              // 19
-    virtual HRESULT RegisterDataDef(IAAFDataDef* dataDef) = 0;                               // 20
-    virtual HRESULT LookupDataDef(aafUID_constref dataDefinitionId,
-                                  IAAFDataDef** dataDef) = 0;                  // 21
-    virtual HRESULT GetDataDefs(IEnumAAFDataDefs** enumerator) = 0;            // 22
-    virtual HRESULT CountDataDefs(aafUInt32* result) = 0;                      // 23
-    virtual HRESULT RegisterOperationDef(IAAFOperationDef* operationDef) = 0;  // 24
-    virtual HRESULT LookupOperationDef(aafUID_constref operationId,
-                                       IAAFOperationDef** operationDef) = 0;   // 25
-    virtual HRESULT GetOperationDefs(IEnumAAFOperationDefs** enumerator) = 0;  // 26
-    virtual HRESULT CountOperationDefs(aafUInt32* result) = 0;                 // 27
-    virtual HRESULT RegisterParameterDef(IAAFParameterDef* parmDef) = 0;       // 28
-    virtual HRESULT LookupParameterDef(aafUID_constref parameterId,
-                                       IAAFParameterDef** parmDef) = 0;                       // 29
-    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;                 // 30
-    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;                                // 31
-    virtual HRESULT RegisterCodecDef(IAAFCodecDef* parmDef) = 0;                              // 32
-    virtual HRESULT LookupCodecDef(aafUID_constref parameterId, IAAFCodecDef** parmDef) = 0;  // 33
-    virtual HRESULT GetCodecDefs(IEnumAAFCodecDefs** enumerator) = 0;                         // 34
-    virtual HRESULT CountCodecDefs(aafUInt32* result) = 0;                                    // 35
-    virtual HRESULT RegisterContainerDef(IAAFContainerDef* parmDef) = 0;                      // 36
-    virtual HRESULT LookupContainerDef(aafUID_constref parameterId,
-                                       IAAFContainerDef** parmDef) = 0;                    // 37
-    virtual HRESULT GetContainerDefs(IEnumAAFContainerDefs** enumerator) = 0;              // 38
-    virtual HRESULT CountContainerDefs(aafUInt32* result) = 0;                             // 39
-    virtual HRESULT RegisterInterpolationDef(IAAFInterpolationDef* interpolationDef) = 0;  // 40
-    virtual HRESULT LookupInterpolationDef(aafUID_constref parameterId,
-                                           IAAFInterpolationDef** interpolationDef) = 0;  // 41
-    virtual HRESULT GetInterpolationDefs(IEnumAAFInterpolationDefs** enumerator) = 0;     // 42
-    virtual HRESULT CountInterpolationDefs(aafUInt32* result) = 0;                        // 43
-    virtual HRESULT RegisterPluginDef(IAAFPluginDef* plugDef) = 0;                        // 44
-    virtual HRESULT LookupPluginDef(aafUID_constref parameterId,
-                                    IAAFPluginDef** plugDef) = 0;        // 45
-    virtual HRESULT GetPluginDefs(IEnumAAFPluginDefs** enumerator) = 0;  // 46
-    virtual HRESULT CountPluginDefs(aafUInt32* result) = 0;              // 47
-
-protected:
-    ~IAAFDictionary() = default;
-};
-
-inline constexpr GUID IID_IAAFDictionary = ncfGuid("B1A21398-1A7D-11D2-BF78-00104BC9156D");
-constexpr const GUID& aafIdOf(const IAAFDictionary*) {
-    return IID_IAAFDictionary;
-}
-
-// Answered by AAFDictionary.
-struct IAAFDictionary2 : IUnknown {
-    virtual HRESULT CreateInstance(aafUID_constref id, REFIID riid, IUnknown** object) = 0;  // 3
-    virtual HRESULT CreateMetaInstance(aafUID_constref id, REFIID riid,
-                                       IUnknown** metaDefinition) = 0;                     // 4
-    virtual HRESULT RegisterClassDef(IAAFClassDef* classDef) = 0;                          // 5
-    virtual HRESULT LookupClassDef(aafUID_constref classId, IAAFClassDef** classDef) = 0;  // 6
-    virtual HRESULT GetClassDefs(IEnumAAFClassDefs** enumerator) = 0;                      // 7
-    virtual HRESULT CountClassDefs(aafUInt32* result) = 0;                                 // 8
-    virtual HRESULT CreateForwardClassReference(aafUID_constref classId) = 0;              // 9
-    virtual HRESULT HasForwardClassReference(aafUID_constref classId,
-                                             aafBoolean_t* result) = 0;                      // 10
-    virtual HRESULT RegisterTypeDef(IAAFTypeDef* typeDef) = 0;                               // 11
-    virtual HRESULT LookupTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;        // 12
-    virtual HRESULT GetTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                          // 13
-    virtual HRESULT CountTypeDefs(aafUInt32* result) = 0;                                    // 14
-    virtual HRESULT RegisterOpaqueTypeDef(IAAFTypeDef* typeDef) = 0;                         // 15
-    virtual HRESULT LookupOpaqueTypeDef(aafUID_constref typeId, IAAFTypeDef** typeDef) = 0;  // 16
-    virtual HRESULT GetOpaqueTypeDefs(IEnumAAFTypeDefs** enumerator) = 0;                    // 17
-    virtual HRESULT CountOpaqueTypeDefs(aafUInt32* result) = 0;                              // 18
-    virtual HRESULT RegisterKLVDataKey(aafUID_t uid, IAAFTypeDef* typeDef) = 0;              // 19
-    virtual HRESULT RegisterDataDef(IAAFDataDef* dataDef) = 0;                               // 20
-    virtual HRESULT LookupDataDef(aafUID_constref dataDefinitionId,
-                                  IAAFDataDef** dataDef) = 0;                  // 21
-    virtual HRESULT GetDataDefs(IEnumAAFDataDefs** enumerator) = 0;            // 22
-    virtual HRESULT CountDataDefs(aafUInt32* result) = 0;                      // 23
-    virtual HRESULT RegisterOperationDef(IAAFOperationDef* operationDef) = 0;  // 24
-    virtual HRESULT LookupOperationDef(aafUID_constref operationId,
-                                       IAAFOperationDef** operationDef) = 0;   // 25
-    virtual HRESULT GetOperationDefs(IEnumAAFOperationDefs** enumerator) = 0;  // 26
-    virtual HRESULT CountOperationDefs(aafUInt32* result) = 0;                 // 27
-    virtual HRESULT RegisterParameterDef(IAAFParameterDef* parmDef) = 0;       // 28
-    virtual HRESULT LookupParameterDef(aafUID_constref parameterId,
-                                       IAAFParameterDef** parmDef) = 0;                       // 29
-    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;                 // 30
-    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;                                // 31
-    virtual HRESULT RegisterCodecDef(IAAFCodecDef* parmDef) = 0;                              // 32
-    virtual HRESULT LookupCodecDef(aafUID_constref parameterId, IAAFCodecDef** parmDef) = 0;  // 33
-    virtual HRESULT GetCodecDefs(IEnumAAFCodecDefs** enumerator) = 0;                         // 34
-    virtual HRESULT CountCodecDefs(aafUInt32* result) = 0;                                    // 35
-    virtual HRESULT RegisterContainerDef(IAAFContainerDef* parmDef) = 0;                      // 36
-    virtual HRESULT LookupContainerDef(aafUID_constref parameterId,
-                                       IAAFContainerDef** parmDef) = 0;                    // 37
-    virtual HRESULT GetContainerDefs(IEnumAAFContainerDefs** enumerator) = 0;              // 38
-    virtual HRESULT CountContainerDefs(aafUInt32* result) = 0;                             // 39
-    virtual HRESULT RegisterInterpolationDef(IAAFInterpolationDef* interpolationDef) = 0;  // 40
-    virtual HRESULT LookupInterpolationDef(aafUID_constref parameterId,
-                                           IAAFInterpolationDef** interpolationDef) = 0;  // 41
-    virtual HRESULT GetInterpolationDefs(IEnumAAFInterpolationDefs** enumerator) = 0;     // 42
-    virtual HRESULT CountInterpolationDefs(aafUInt32* result) = 0;                        // 43
-    virtual HRESULT RegisterPluginDef(IAAFPluginDef* plugDef) = 0;                        // 44
-    virtual HRESULT LookupPluginDef(aafUID_constref parameterId,
-                                    IAAFPluginDef** plugDef) = 0;                              // 45
-    virtual HRESULT GetPluginDefs(IEnumAAFPluginDefs** enumerator) = 0;                        // 46
-    virtual HRESULT CountPluginDefs(aafUInt32* result) = 0;                                    // 47
-    virtual HRESULT RegisterKLVDataDef(IAAFKLVDataDefinition* def) = 0;                        // 48
-    virtual HRESULT LookupKLVDataDef(aafUID_constref defId, IAAFKLVDataDefinition** def) = 0;  // 49
-    virtual HRESULT GetKLVDataDefs(IEnumAAFKLVDataDefs** enumerator) = 0;                      // 50
-    virtual HRESULT CountKLVDataDefs(aafUInt32* result) = 0;                                   // 51
-    virtual HRESULT RegisterTaggedValueDef(IAAFTaggedValueDefinition* def) = 0;                // 52
-    virtual HRESULT LookupTaggedValueDef(aafUID_constref defId,
-                                         IAAFTaggedValueDefinition** def) = 0;     // 53
-    virtual HRESULT GetTaggedValueDefs(IEnumAAFTaggedValueDefs** enumerator) = 0;  // 54
-    virtual HRESULT CountTaggedValueDefs(aafUInt32* result) = 0;                   // 55
-    virtual HRESULT LookupAuxiliaryDataDef(IAAFDataDef** dataDef) = 0;             // 56
-    virtual HRESULT LookupDescriptiveMetadataDataDef(IAAFDataDef** dataDef) = 0;   // 57
-    virtual HRESULT LookupEdgecodeDataDef(IAAFDataDef** dataDef) = 0;              // 58
-    virtual HRESULT LookupLegacyPictureDataDef(IAAFDataDef** dataDef) = 0;         // 59
-    virtual HRESULT LookupLegacySoundDataDef(IAAFDataDef** dataDef) = 0;           // 60
-    virtual HRESULT LookupLegacyTimecodeDataDef(IAAFDataDef** dataDef) = 0;        // 61
-    virtual HRESULT LookupMatteDataDef(IAAFDataDef** dataDef) = 0;                 // 62
-    virtual HRESULT LookupPictureDataDef(IAAFDataDef** dataDef) = 0;               // 63
-    virtual HRESULT LookupPictureWithMatteDataDef(IAAFDataDef** dataDef) = 0;      // 64
-    virtual HRESULT LookupSoundDataDef(IAAFDataDef** dataDef) = 0;                 // 65
-    virtual HRESULT LookupTimecodeDataDef(IAAFDataDef** dataDef) = 0;              // 66
-
-protected:
-    ~IAAFDictionary2() = default;
-};
-
-inline constexpr GUID IID_IAAFDictionary2 = ncfGuid("952A5C85-DCEC-4C99-8E40-978D88A0CDC1");
-constexpr const GUID& aafIdOf(const IAAFDictionary2*) {
-    return IID_IAAFDictionary2;
-}
 
 // Answered by AAFDefObject.
 struct IAAFDefObject : IUnknown {
@@ -373,20 +208,6 @@ constexpr const GUID& aafIdOf(const IEnumAAFCodecDefs*) {
     return IID_IEnumAAFCodecDefs;
 }
 
-// Answered by AAFInterpolationDef.
-struct IAAFInterpolationDef : IUnknown {
-    virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;  // 3
-
-protected:
-    ~IAAFInterpolationDef() = default;
-};
-
-inline constexpr GUID IID_IAAFInterpolationDef = ncfGuid("293600A3-0D37-11D3-80A9-006008143E6F");
-constexpr const GUID& aafIdOf(const IAAFInterpolationDef*) {
-    return IID_IAAFInterpolationDef;
-}
-
 // Answered by AAFKLVDataDefinition.
 struct IAAFKLVDataDefinition : IUnknown {
     virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
@@ -405,145 +226,6 @@ protected:
 inline constexpr GUID IID_IAAFKLVDataDefinition = ncfGuid("F6AF8700-949C-4304-9706-C0576B53F4AA");
 constexpr const GUID& aafIdOf(const IAAFKLVDataDefinition*) {
     return IID_IAAFKLVDataDefinition;
-}
-
-// Answered by AAFOperationDef.
-struct IAAFOperationDef : IUnknown {
-    virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;              // 3
-    virtual HRESULT GetDataDef(IAAFDataDef** dataDef) = 0;                          // 4
-    virtual HRESULT SetDataDef(IAAFDataDef* dataDef) = 0;                           // 5
-    virtual HRESULT IsTimeWarp(aafBoolean_t* bIsTimeWarp) = 0;                      // 6
-    virtual HRESULT SetIsTimeWarp(aafBoolean_t isTimeWarp) = 0;                     // 7
-    virtual HRESULT PrependDegradeToOperation(IAAFOperationDef* operationDef) = 0;  // 8
-    virtual HRESULT AppendDegradeToOperation(IAAFOperationDef* operationDef) = 0;   // 9
-    virtual HRESULT InsertDegradeToOperationAt(aafUInt32 index,
-                                               IAAFOperationDef* operationDef) = 0;  // 10
-    virtual HRESULT RemoveDegradeToOperationAt(aafUInt32 index) = 0;                 // 11
-    virtual HRESULT GetDegradeToOperations(IEnumAAFOperationDefs** enumerator) = 0;  // 12
-    virtual HRESULT CountDegradeToOperations(aafUInt32* result) = 0;                 // 13
-    virtual HRESULT GetCategory(aafUID_t* value) = 0;                                // 14
-    virtual HRESULT SetCategory(aafUID_constref value) = 0;                          // 15
-    virtual HRESULT GetNumberInputs(aafInt32* numberInputs) = 0;                     // 16
-    virtual HRESULT SetNumberInputs(aafInt32 numberInputs) = 0;                      // 17
-    virtual HRESULT GetBypass(aafUInt32* bypass) = 0;                                // 18
-    virtual HRESULT SetBypass(aafUInt32 bypass) = 0;                                 // 19
-    virtual HRESULT AddParameterDef(IAAFParameterDef* parameterDef) = 0;             // 20
-    virtual HRESULT GetParameterDefs(IEnumAAFParameterDefs** enumerator) = 0;        // 21
-    virtual HRESULT CountParameterDefs(aafUInt32* result) = 0;                       // 22
-    virtual HRESULT LookupParameterDef(aafUID_constref parameterDefId,
-                                       IAAFParameterDef** parameterDef) = 0;  // 23
-
-protected:
-    ~IAAFOperationDef() = default;
-};
-
-inline constexpr GUID IID_IAAFOperationDef = ncfGuid("14035D91-1FF5-11D2-BF97-006097116212");
-constexpr const GUID& aafIdOf(const IAAFOperationDef*) {
-    return IID_IAAFOperationDef;
-}
-
-// Answered by AAFParameterDef.
-struct IAAFParameterDef : IUnknown {
-    virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description, IAAFTypeDef* type) = 0;  // 3
-    virtual HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) = 0;                          // 4
-    virtual HRESULT SetDisplayUnits(aafCharacter_constptr displayUnits) = 0;               // 5
-    virtual HRESULT GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) = 0;    // 6
-    virtual HRESULT GetDisplayUnitsBufLen(aafUInt32* bufSize) = 0;                         // 7
-
-protected:
-    ~IAAFParameterDef() = default;
-};
-
-inline constexpr GUID IID_IAAFParameterDef = ncfGuid("20045FA1-1D87-11D2-BF96-006097116212");
-constexpr const GUID& aafIdOf(const IAAFParameterDef*) {
-    return IID_IAAFParameterDef;
-}
-
-// Answered by AAFPluginDef.
-struct IAAFPluginDef : IUnknown {
-    virtual HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                               aafCharacter_constptr description) = 0;                      // 3
-    virtual HRESULT GetCategoryClass(aafUID_t* categoryClass) = 0;                          // 4
-    virtual HRESULT SetCategoryClass(aafUID_constref categoryClass) = 0;                    // 5
-    virtual HRESULT GetPluginVersion(aafVersionType_t* version) = 0;                        // 6
-    virtual HRESULT SetPluginVersion(aafVersionType_t* version) = 0;                        // 7
-    virtual HRESULT SetPluginVersionString(aafCharacter_constptr pluginVersionString) = 0;  // 8
-    virtual HRESULT GetPluginVersionString(aafCharacter* pluginVersionString,
-                                           aafUInt32 bufSize) = 0;         // 9
-    virtual HRESULT GetPluginVersionStringBufLen(aafUInt32* bufSize) = 0;  // 10
-    virtual HRESULT SetPluginManufacturerName(
-        aafCharacter_constptr pluginManufacturerName) = 0;  // 11
-    virtual HRESULT GetPluginManufacturerName(aafCharacter* pluginManufacturerName,
-                                              aafUInt32 bufSize) = 0;                        // 12
-    virtual HRESULT GetPluginManufacturerNameBufLen(aafUInt32* bufSize) = 0;                 // 13
-    virtual HRESULT GetManufacturerInfo(IAAFNetworkLocator** result) = 0;                    // 14
-    virtual HRESULT SetManufacturerInfo(IAAFNetworkLocator* manufacturerInfo) = 0;           // 15
-    virtual HRESULT GetManufacturerID(aafUID_t* manufacturerID) = 0;                         // 16
-    virtual HRESULT SetManufacturerID(aafUID_constref manufacturerID) = 0;                   // 17
-    virtual HRESULT GetHardwarePlatform(aafHardwarePlatform_t* hardwarePlatform) = 0;        // 18
-    virtual HRESULT SetHardwarePlatform(aafHardwarePlatform_constref hardwarePlatform) = 0;  // 19
-    virtual HRESULT GetPlatformVersionRange(aafVersionType_t* minVersion,
-                                            aafVersionType_t* maxVersion) = 0;          // 20
-    virtual HRESULT SetPlatformMinimumVersion(aafVersionType_constref minVersion) = 0;  // 21
-    virtual HRESULT SetPlatformMaximumVersion(aafVersionType_constref maxVersion) = 0;  // 22
-    virtual HRESULT GetEngine(aafEngine_t* engine) = 0;                                 // 23
-    virtual HRESULT SetEngine(aafEngine_constref engine) = 0;                           // 24
-    virtual HRESULT GetEngineVersionRange(aafVersionType_t* minVersion,
-                                          aafVersionType_t* maxVersion) = 0;          // 25
-    virtual HRESULT SetEngineMinimumVersion(aafVersionType_constref minVersion) = 0;  // 26
-    virtual HRESULT SetEngineMaximumVersion(aafVersionType_constref maxVersion) = 0;  // 27
-    virtual HRESULT GetPluginAPI(aafPluginAPI_t* pluginAPI) = 0;                      // 28
-    virtual HRESULT SetPluginAPI(aafPluginAPI_constref pluginAPI) = 0;                // 29
-    virtual HRESULT GetPluginAPIVersionRange(aafVersionType_t* minVersion,
-                                             aafVersionType_t* maxVersion) = 0;          // 30
-    virtual HRESULT SetPluginAPIMinimumVersion(aafVersionType_constref minVersion) = 0;  // 31
-    virtual HRESULT SetPluginAPIMaximumVersion(aafVersionType_constref maxVersion) = 0;  // 32
-    virtual HRESULT IsSoftwareOnly(aafBoolean_t* isSoftwareOnly) = 0;                    // 33
-    virtual HRESULT SetIsSoftwareOnly(aafBoolean_t isSoftwareOnly) = 0;                  // 34
-    virtual HRESULT IsAccelerated(aafBoolean_t* isAccelerated) = 0;                      // 35
-    virtual HRESULT SetIsAccelerated(aafBoolean_t isAccelerated) = 0;                    // 36
-    virtual HRESULT SupportsAuthentication(aafBoolean_t* supportsAuthentication) = 0;    // 37
-    virtual HRESULT SetSupportsAuthentication(aafBoolean_t supportsAuthentication) = 0;  // 38
-    virtual HRESULT CountLocators(aafUInt32* result) = 0;                                // 39
-    virtual HRESULT AppendLocator(IAAFLocator* locator) = 0;                             // 40
-    virtual HRESULT PrependLocator(IAAFLocator* locator) = 0;                            // 41
-    virtual HRESULT InsertLocatorAt(aafUInt32 index, IAAFLocator* locator) = 0;          // 42
-    virtual HRESULT GetLocatorAt(aafUInt32 index, IAAFLocator** locator) = 0;            // 43
-    virtual HRESULT RemoveLocatorAt(aafUInt32 index) = 0;                                // 44
-    virtual HRESULT GetLocators(IEnumAAFPluginLocators** enumerator) = 0;                // 45
-    virtual HRESULT SetDefinitionObjectID(aafUID_t def) = 0;                             // 46
-    virtual HRESULT GetDefinitionObjectID(aafUID_t* def) = 0;                            // 47
-
-protected:
-    ~IAAFPluginDef() = default;
-};
-
-inline constexpr GUID IID_IAAFPluginDef = ncfGuid("AD1BB854-DBB2-11D2-809C-006008143E6F");
-constexpr const GUID& aafIdOf(const IAAFPluginDef*) {
-    return IID_IAAFPluginDef;
-}
-
-// Answered by AAFPluginManager.
-struct IAAFPluginManager : IUnknown {
-    virtual HRESULT RegisterSharedPlugins() = 0;                                       // 3
-    virtual HRESULT RegisterPluginDirectory(aafCharacter_constptr directoryName) = 0;  // 4
-    virtual HRESULT RegisterPluginFile(aafCharacter_constptr fileName) = 0;            // 5
-    virtual HRESULT EnumLoadedPlugins(aafUID_constref categoryID,
-                                      IEnumAAFLoadedPlugins** enumerator) = 0;  // 6
-    virtual HRESULT CreatePluginDefinition(aafUID_constref pluginDefID, IAAFDictionary* dictionary,
-                                           IAAFDefObject** pluginDef) = 0;  // 7
-    virtual HRESULT CreateInstance(REFCLSID rclsid, IUnknown* unkOuter, REFIID riid,
-                                   void** plugin) = 0;  // 8
-
-protected:
-    ~IAAFPluginManager() = default;
-};
-
-inline constexpr GUID IID_IAAFPluginManager = ncfGuid("AD1BB85C-DBB2-11D2-809C-006008143E6F");
-constexpr const GUID& aafIdOf(const IAAFPluginManager*) {
-    return IID_IAAFPluginManager;
 }
 
 // Answered by AAFTaggedValueDefinition.
@@ -565,42 +247,6 @@ constexpr const GUID& aafIdOf(const IAAFTaggedValueDefinition*) {
     return IID_IAAFTaggedValueDefinition;
 }
 
-// Answered by EnumAAFCodecFlavours.
-struct IEnumAAFCodecFlavours : IUnknown {
-    virtual HRESULT NextOne(aafUID_t* AAFCodecFlavour) = 0;                                     // 3
-    virtual HRESULT Next(aafUInt32 count, aafUID_t* AAFCodecFlavours, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;                                                  // 5
-    virtual HRESULT Reset() = 0;                                                                // 6
-    virtual HRESULT Clone(IEnumAAFCodecFlavours** enumerator) = 0;                              // 7
-
-protected:
-    ~IEnumAAFCodecFlavours() = default;
-};
-
-inline constexpr GUID IID_IEnumAAFCodecFlavours = ncfGuid("AB4D9F12-DD69-11D2-809C-006008143E6F");
-constexpr const GUID& aafIdOf(const IEnumAAFCodecFlavours*) {
-    return IID_IEnumAAFCodecFlavours;
-}
-
-// Answered by EnumAAFInterpolationDefs.
-struct IEnumAAFInterpolationDefs : IUnknown {
-    virtual HRESULT NextOne(IAAFInterpolationDef** interpolationDefs) = 0;  // 3
-    virtual HRESULT Next(aafUInt32 count, IAAFInterpolationDef** interpolationDefs,
-                         aafUInt32* numFetched) = 0;                    // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;                          // 5
-    virtual HRESULT Reset() = 0;                                        // 6
-    virtual HRESULT Clone(IEnumAAFInterpolationDefs** enumerator) = 0;  // 7
-
-protected:
-    ~IEnumAAFInterpolationDefs() = default;
-};
-
-inline constexpr GUID IID_IEnumAAFInterpolationDefs =
-    ncfGuid("293600A5-0D37-11D3-80A9-006008143E6F");
-constexpr const GUID& aafIdOf(const IEnumAAFInterpolationDefs*) {
-    return IID_IEnumAAFInterpolationDefs;
-}
-
 // Answered by EnumAAFKLVDataDefs.
 struct IEnumAAFKLVDataDefs : IUnknown {
     virtual HRESULT NextOne(IAAFKLVDataDefinition** KLVDataDefs) = 0;  // 3
@@ -617,94 +263,6 @@ protected:
 inline constexpr GUID IID_IEnumAAFKLVDataDefs = ncfGuid("2A368C5C-E5AF-43C8-8E5A-E78BA02F5F3B");
 constexpr const GUID& aafIdOf(const IEnumAAFKLVDataDefs*) {
     return IID_IEnumAAFKLVDataDefs;
-}
-
-// Answered by EnumAAFLoadedPlugins.
-struct IEnumAAFLoadedPlugins : IUnknown {
-    virtual HRESULT NextOne(aafUID_t* AAFPluginID) = 0;                                     // 3
-    virtual HRESULT Next(aafUInt32 count, aafUID_t* AAFPluginIDs, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;                                              // 5
-    virtual HRESULT Reset() = 0;                                                            // 6
-    virtual HRESULT Clone(IEnumAAFLoadedPlugins** enumerator) = 0;                          // 7
-
-protected:
-    ~IEnumAAFLoadedPlugins() = default;
-};
-
-inline constexpr GUID IID_IEnumAAFLoadedPlugins = ncfGuid("AB4D9F14-DD69-11D2-809C-006008143E6F");
-constexpr const GUID& aafIdOf(const IEnumAAFLoadedPlugins*) {
-    return IID_IEnumAAFLoadedPlugins;
-}
-
-// Answered by EnumAAFOperationDefs.
-struct IEnumAAFOperationDefs : IUnknown {
-    virtual HRESULT NextOne(IAAFOperationDef** operationDefs) = 0;  // 3
-    virtual HRESULT Next(aafUInt32 count, IAAFOperationDef** operationDefs,
-                         aafUInt32* numFetched) = 0;                // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;                      // 5
-    virtual HRESULT Reset() = 0;                                    // 6
-    virtual HRESULT Clone(IEnumAAFOperationDefs** enumerator) = 0;  // 7
-
-protected:
-    ~IEnumAAFOperationDefs() = default;
-};
-
-inline constexpr GUID IID_IEnumAAFOperationDefs = ncfGuid("92B88021-2B2B-11D2-BF7E-00104BC9156D");
-constexpr const GUID& aafIdOf(const IEnumAAFOperationDefs*) {
-    return IID_IEnumAAFOperationDefs;
-}
-
-// Answered by EnumAAFParameterDefs.
-struct IEnumAAFParameterDefs : IUnknown {
-    virtual HRESULT NextOne(IAAFParameterDef** parameterDef) = 0;  // 3
-    virtual HRESULT Next(aafUInt32 count, IAAFParameterDef** parameterDefs,
-                         aafUInt32* fetched) = 0;                   // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;                      // 5
-    virtual HRESULT Reset() = 0;                                    // 6
-    virtual HRESULT Clone(IEnumAAFParameterDefs** enumerator) = 0;  // 7
-
-protected:
-    ~IEnumAAFParameterDefs() = default;
-};
-
-inline constexpr GUID IID_IEnumAAFParameterDefs = ncfGuid("B1A213A4-1A7D-11D2-BF78-00104BC9156D");
-constexpr const GUID& aafIdOf(const IEnumAAFParameterDefs*) {
-    return IID_IEnumAAFParameterDefs;
-}
-
-// Answered by EnumAAFPluginDefs.
-struct IEnumAAFPluginDefs : IUnknown {
-    virtual HRESULT NextOne(IAAFPluginDef** pluginDefs) = 0;  // 3
-    virtual HRESULT Next(aafUInt32 count, IAAFPluginDef** pluginDefs,
-                         aafUInt32* numFetched) = 0;             // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;                   // 5
-    virtual HRESULT Reset() = 0;                                 // 6
-    virtual HRESULT Clone(IEnumAAFPluginDefs** enumerator) = 0;  // 7
-
-protected:
-    ~IEnumAAFPluginDefs() = default;
-};
-
-inline constexpr GUID IID_IEnumAAFPluginDefs = ncfGuid("AD1BB85F-DBB2-11D2-809C-006008143E6F");
-constexpr const GUID& aafIdOf(const IEnumAAFPluginDefs*) {
-    return IID_IEnumAAFPluginDefs;
-}
-
-// Answered by EnumAAFPluginLocators.
-struct IEnumAAFPluginLocators : IUnknown {
-    virtual HRESULT NextOne(IAAFLocator** AAFLocator) = 0;                                     // 3
-    virtual HRESULT Next(aafUInt32 count, IAAFLocator** AAFLocators, aafUInt32* fetched) = 0;  // 4
-    virtual HRESULT Skip(aafUInt32 count) = 0;                                                 // 5
-    virtual HRESULT Reset() = 0;                                                               // 6
-    virtual HRESULT Clone(IEnumAAFPluginLocators** enumerator) = 0;                            // 7
-
-protected:
-    ~IEnumAAFPluginLocators() = default;
-};
-
-inline constexpr GUID IID_IEnumAAFPluginLocators = ncfGuid("AD1BB861-DBB2-11D2-809C-006008143E6F");
-constexpr const GUID& aafIdOf(const IEnumAAFPluginLocators*) {
-    return IID_IEnumAAFPluginLocators;
 }
 
 // Answered by EnumAAFTaggedValueDefs.

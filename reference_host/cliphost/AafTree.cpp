@@ -7,9 +7,14 @@
 #include <map>
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFEffectDefinitions.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/aaf/AAFObjects.h"
+#include "host_interfaces/aaf/AAFPluginDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "reference_host/cliphost/AafValue.h"
 
 namespace cliphost {

@@ -9,6 +9,8 @@
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "reference_host/util/text/Encodings.h"
 

@@ -8,6 +8,8 @@
 
 #include "host_interfaces/aaf/AAFDescriptors.h"
 #include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
+#include "host_interfaces/aaf/AAFSoundDescriptors.h"
 #include "reference_host/cliphost/AafRef.h"
 
 namespace cliphost {

@@ -3,7 +3,9 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "source/aaf/AAFSmartPointer.h"
 
 namespace NMA::Impl {

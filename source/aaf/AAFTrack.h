@@ -4,7 +4,8 @@
 
 #include <string>
 
-#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/framework/ResultCodes.h"
 #include "source/aaf/AAFSmartPointer.h"

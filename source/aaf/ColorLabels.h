@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/clips/ClipRecords.h"
 

@@ -2,10 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "host_interfaces/aaf/AAFDefinitions.h"
-#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFFile.h"
-#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/clips/ClipRecords.h"
 

@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/framework/ResultCodes.h"
 #include "host_interfaces/util/NMAString.h"

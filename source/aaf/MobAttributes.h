@@ -2,10 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "host_interfaces/aaf/AAFDefinitions.h"
-#include "host_interfaces/aaf/AAFMetaDefinitions.h"
-#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
 #include "host_interfaces/aaf/AAFObjects.h"
+#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "host_interfaces/framework/ResultCodes.h"
 #include "source/aaf/AAFSmartPointer.h"
 

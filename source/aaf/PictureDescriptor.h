@@ -4,10 +4,11 @@
 
 #include <tr1/memory>
 
-#include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFFile.h"
 #include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/clips/BaseClip.h"
 #include "source/descriptor_data/AAFInfo.h"

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/plugin/ResultChecks.h"
 

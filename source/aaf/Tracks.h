@@ -4,9 +4,10 @@
 
 #include <tr1/memory>
 
-#include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFFile.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/clips/BaseClip.h"

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFFile.h"
-#include "reference_host/aaf/model/NotImplementedFile.h"
+#include "not_implemented/AAFFile.h"
 #include "reference_host/aaf/model/Unknown.h"
 
 namespace aaf {

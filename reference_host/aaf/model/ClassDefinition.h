@@ -4,6 +4,7 @@
 
 #include <vector>
 
+#include "not_implemented/AAFMetaDefinitions.h"
 #include "reference_host/aaf/model/PropertyDefinition.h"
 
 namespace aaf {

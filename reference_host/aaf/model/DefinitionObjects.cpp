@@ -5,6 +5,7 @@
 #include <algorithm>
 
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "reference_host/aaf/model/Enumerator.h"
 
 namespace aaf {

@@ -2,7 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "reference_host/aaf/model/NotImplementedDefinitions.h"
+#include "not_implemented/AAFDefinitions.h"
+#include "not_implemented/AAFEffectDefinitions.h"
+#include "not_implemented/AAFPluginDefinitions.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

@@ -4,7 +4,7 @@
 
 #include <string>
 
-#include "reference_host/aaf/model/NotImplementedMetaDefinitions.h"
+#include "not_implemented/AAFMetaDefinitions.h"
 #include "reference_host/aaf/model/Unknown.h"
 
 namespace aaf {

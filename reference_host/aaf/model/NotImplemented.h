@@ -6,8 +6,9 @@ namespace aaf {
 
 // An interface whose every operation answers AAFRESULT_NOT_IMPLEMENTED. Classes
 // are built on these, so that each states only the operations that it has. The
-// NotImplemented...h headers hold one specialisation for each published
-// interface; a test compares them slot by slot.
+// build writes one specialisation for each published interface into the headers
+// of not_implemented/ (see cmake/NotImplementedInterfaces.cmake); a test compares
+// them slot by slot.
 template <class Interface>
 class NotImplemented;
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFObjects.h"
 #include "reference_host/aaf/model/Object.h"
 #include "reference_host/aaf/model/PropertyDefinition.h"
 

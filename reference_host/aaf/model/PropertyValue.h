@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "host_interfaces/aaf/AAFObjects.h"
-#include "reference_host/aaf/model/NotImplementedObjects.h"
+#include "not_implemented/AAFObjects.h"
 #include "reference_host/aaf/model/PropertyKey.h"
 #include "reference_host/aaf/model/Unknown.h"
 

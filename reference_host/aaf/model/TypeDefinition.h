@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFTypeDefinitions.h"
 #include "reference_host/aaf/model/BuiltIn.h"
 #include "reference_host/aaf/model/MetaDefinition.h"
 #include "reference_host/aaf/model/PropertyValue.h"

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFTypeDefinitions.h"
 #include "reference_host/aaf/model/TypeDefinition.h"
 
 namespace aaf {

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFTypeDefinitionsOfMany.h"
 #include "reference_host/aaf/model/TypeOfElements.h"
 
 namespace aaf {

@@ -3,8 +3,9 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFObjects.h"
+#include "not_implemented/AAFObjects.h"
+#include "not_implemented/AAFSoundDescriptors.h"
 #include "reference_host/aaf/model/Enumerator.h"
-#include "reference_host/aaf/model/NotImplementedObjects.h"
 #include "reference_host/aaf/objects/PhysicalDescriptors.h"
 
 namespace aaf {

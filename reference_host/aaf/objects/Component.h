@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFComponents.h"
-#include "reference_host/aaf/model/NotImplementedComponents.h"
+#include "not_implemented/AAFComponents.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

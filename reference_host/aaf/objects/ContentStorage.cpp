@@ -4,9 +4,9 @@
 
 #include "host_interfaces/aaf/AAFEssenceData.h"
 #include "host_interfaces/aaf/AAFMobs.h"
+#include "not_implemented/AAFEssenceData.h"
 #include "reference_host/aaf/model/Enumerator.h"
 #include "reference_host/aaf/model/Model.h"
-#include "reference_host/aaf/model/NotImplementedEssenceData.h"
 #include "reference_host/aaf/objects/Checks.h"
 #include "reference_host/aaf/objects/EssenceData.h"
 #include "reference_host/aaf/objects/Mob.h"

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFEvents.h"
+#include "not_implemented/AAFObjects.h"
 #include "reference_host/aaf/objects/Arrays.h"
 #include "reference_host/aaf/objects/OtherComponents.h"
 #include "reference_host/aaf/objects/SourceClip.h"

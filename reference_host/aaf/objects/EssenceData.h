@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFEssenceData.h"
-#include "reference_host/aaf/model/NotImplementedEssenceData.h"
+#include "not_implemented/AAFEssenceData.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

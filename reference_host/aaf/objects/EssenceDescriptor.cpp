@@ -3,8 +3,8 @@
 #include "reference_host/aaf/objects/EssenceDescriptor.h"
 
 #include "host_interfaces/aaf/AAFLocators.h"
+#include "not_implemented/AAFLocators.h"
 #include "reference_host/aaf/model/Enumerator.h"
-#include "reference_host/aaf/model/NotImplementedLocators.h"
 
 namespace aaf {
 

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFDescriptors.h"
-#include "reference_host/aaf/model/NotImplementedDescriptors.h"
+#include "not_implemented/AAFDescriptors.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

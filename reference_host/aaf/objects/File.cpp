@@ -3,7 +3,7 @@
 #include "reference_host/aaf/objects/File.h"
 
 #include "host_interfaces/aaf/AAFClassIds.h"
-#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFExports.h"
 #include "reference_host/aaf/model/Dictionary.h"
 #include "reference_host/aaf/objects/ContentStorage.h"

@@ -5,8 +5,8 @@
 #include <filesystem>
 
 #include "host_interfaces/aaf/AAFFile.h"
+#include "not_implemented/AAFFile.h"
 #include "reference_host/aaf/model/Model.h"
-#include "reference_host/aaf/model/NotImplementedFile.h"
 #include "reference_host/aaf/objects/Header.h"
 
 namespace aaf {

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFDescriptors.h"
 #include "reference_host/aaf/objects/EssenceDescriptor.h"
 
 namespace aaf {

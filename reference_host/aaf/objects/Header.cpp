@@ -3,7 +3,7 @@
 #include "reference_host/aaf/objects/Header.h"
 
 #include "host_interfaces/aaf/AAFClassIds.h"
-#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFEssenceData.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "reference_host/aaf/model/Enumerator.h"

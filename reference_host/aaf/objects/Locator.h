@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFLocators.h"
-#include "reference_host/aaf/model/NotImplementedLocators.h"
+#include "not_implemented/AAFLocators.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFPictureDescriptors.h"
 #include "reference_host/aaf/objects/CDCIDescriptor.h"
 
 namespace aaf {

@@ -3,6 +3,9 @@
 #include "reference_host/aaf/objects/Mob.h"
 
 #include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFEffects.h"
+#include "host_interfaces/aaf/AAFEvents.h"
+#include "host_interfaces/aaf/AAFTimecodes.h"
 #include "reference_host/aaf/model/Enumerator.h"
 #include "reference_host/aaf/objects/Annotations.h"
 #include "reference_host/aaf/objects/ContentStorage.h"

@@ -4,8 +4,10 @@
 
 #include <unordered_map>
 
+#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFMobs.h"
-#include "reference_host/aaf/model/NotImplementedMobs.h"
+#include "not_implemented/AAFMobSlots.h"
+#include "not_implemented/AAFMobs.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

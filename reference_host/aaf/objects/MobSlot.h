@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "host_interfaces/aaf/AAFMobs.h"
-#include "reference_host/aaf/model/NotImplementedMobs.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
+#include "not_implemented/AAFMobSlots.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

@@ -4,6 +4,7 @@
 
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFEffectDefinitions.h"
 #include "reference_host/aaf/model/Enumerator.h"
 #include "reference_host/aaf/objects/Annotations.h"
 #include "reference_host/aaf/objects/Checks.h"

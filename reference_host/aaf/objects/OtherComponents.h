@@ -2,6 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFComponents.h"
+#include "not_implemented/AAFEffects.h"
+#include "not_implemented/AAFEvents.h"
+#include "not_implemented/AAFTimecodes.h"
 #include "reference_host/aaf/objects/Component.h"
 
 // Components and parameters that this system does not make but meets in the

@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFDescriptors.h"
+#include "not_implemented/AAFPictureDescriptors.h"
+#include "not_implemented/AAFSoundDescriptors.h"
 #include "reference_host/aaf/objects/Arrays.h"
 #include "reference_host/aaf/objects/Checks.h"
 #include "reference_host/aaf/objects/FileDescriptor.h"

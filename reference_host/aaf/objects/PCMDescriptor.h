@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFSoundDescriptors.h"
 #include "reference_host/aaf/objects/SoundDescriptor.h"
 
 namespace aaf {

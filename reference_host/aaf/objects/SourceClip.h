@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFComponents.h"
 #include "reference_host/aaf/objects/Component.h"
 
 namespace aaf {

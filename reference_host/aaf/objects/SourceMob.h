@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "not_implemented/AAFMobs.h"
 #include "reference_host/aaf/objects/Mob.h"
 
 namespace aaf {

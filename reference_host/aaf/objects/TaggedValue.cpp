@@ -4,7 +4,7 @@
 
 #include <cwchar>
 
-#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "reference_host/aaf/model/Model.h"
 #include "reference_host/aaf/model/TypeDefinition.h"

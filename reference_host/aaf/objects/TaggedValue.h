@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFObjects.h"
-#include "reference_host/aaf/model/NotImplementedObjects.h"
+#include "not_implemented/AAFObjects.h"
 #include "reference_host/aaf/model/Object.h"
 
 namespace aaf {

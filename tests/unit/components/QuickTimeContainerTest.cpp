@@ -4,6 +4,8 @@
 #include "source/components/QuickTimeContainer.h"
 
 #include "host_interfaces/aaf/AAFFile.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/header_parser/QTParser.h"

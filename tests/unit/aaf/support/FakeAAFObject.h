@@ -9,7 +9,7 @@
 #include <vector>
 
 #include "host_interfaces/aaf/AAF.h"
-#include "reference_host/aaf/model/NotImplementedAll.h"
+#include "not_implemented/AAF.h"
 #include "tests/unit/aaf/support/FakeAAF.h"
 
 // One object of the fake library. Its interfaces are faces that count into it.

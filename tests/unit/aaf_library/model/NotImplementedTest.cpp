@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
-#include "reference_host/aaf/model/NotImplementedAll.h"
+#include "not_implemented/AAF.h"
 
 // Calls every slot of every interface as a caller does that knows nothing but its
 // place, and expects the published answer of an operation without implementation.

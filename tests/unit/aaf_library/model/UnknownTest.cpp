@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "not_implemented/AAFTypeDefinitions.h"
 #include "tests/unit/aaf_library/model/ModelFixture.h"
 
 namespace {
