@@ -20,7 +20,7 @@ function(not_implemented_interfaces name)
     string(REGEX REPLACE "[ \n]+" " " text "${text}")
     string(REGEX MATCHALL "struct [A-Za-z0-9]+ :|virtual HRESULT [^=]+= 0" parts "${text}")
     set(code "#pragma once\n#include \"${header}\"\n#include \"host_interfaces/aaf/AAFResultCodes.h\"
-#include \"reference_host/aaf/model/NotImplemented.h\"\nnamespace aaf {\n")
+#include \"aaf_library/model/NotImplemented.h\"\nnamespace aaf {\n")
     set(end "")
     foreach(part IN LISTS parts)
       if(part MATCHES "^struct (.*) :")

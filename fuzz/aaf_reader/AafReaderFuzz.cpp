@@ -1,13 +1,13 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "aaf_library/model/ClassRegistry.h"
+#include "aaf_library/model/Model.h"
+#include "aaf_library/stored/ModelReader.h"
+#include "aaf_library/stored/ModelWriter.h"
+#include "aaf_library/stored/StoredError.h"
+#include "aaf_library/stored/TreeReader.h"
+#include "aaf_library/stored/TreeWriter.h"
 #include "fuzz/support/RunLimits.h"
-#include "reference_host/aaf/model/ClassRegistry.h"
-#include "reference_host/aaf/model/Model.h"
-#include "reference_host/aaf/stored/ModelReader.h"
-#include "reference_host/aaf/stored/ModelWriter.h"
-#include "reference_host/aaf/stored/StoredError.h"
-#include "reference_host/aaf/stored/TreeReader.h"
-#include "reference_host/aaf/stored/TreeWriter.h"
 
 #include <cstdlib>
 

@@ -3,7 +3,7 @@
 #include <map>
 #include <set>
 
-#include "reference_host/aaf/model/Text.h"
+#include "aaf_library/model/Text.h"
 #include "tests/unit/aaf_library/model/ModelFixture.h"
 
 namespace {

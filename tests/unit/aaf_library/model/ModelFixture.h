@@ -4,14 +4,14 @@
 
 #include <gtest/gtest.h>
 
+#include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/model/Dictionary.h"
+#include "aaf_library/model/Model.h"
+#include "aaf_library/model/TypeDefinition.h"
 #include "host_interfaces/aaf/AAF.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
-#include "reference_host/aaf/model/ClassDefinition.h"
-#include "reference_host/aaf/model/Dictionary.h"
-#include "reference_host/aaf/model/Model.h"
-#include "reference_host/aaf/model/TypeDefinition.h"
 
 // A model of its own for each test, seen through the published interfaces. The
 // classes of other rooms are not there, so their objects answer IAAFObject only.

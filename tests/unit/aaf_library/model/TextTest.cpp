@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/aaf/model/Text.h"
+#include "aaf_library/model/Text.h"
 
 #include <gtest/gtest.h>
 

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "reference_host/aaf/stored/MetaRecords.h"
+#include "aaf_library/stored/MetaRecords.h"
 
 namespace aaf::stored::sample {
 

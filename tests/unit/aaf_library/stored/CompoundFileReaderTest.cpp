@@ -1,10 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/aaf/stored/CompoundFileReader.h"
+#include "aaf_library/stored/CompoundFileReader.h"
 
-#include "reference_host/aaf/stored/CompoundFileFormat.h"
-#include "reference_host/aaf/stored/CompoundFileWriter.h"
-#include "reference_host/aaf/stored/StoredError.h"
+#include "aaf_library/stored/CompoundFileFormat.h"
+#include "aaf_library/stored/CompoundFileWriter.h"
+#include "aaf_library/stored/StoredError.h"
 
 #include <gtest/gtest.h>
 

@@ -1,11 +1,11 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/aaf/stored/CompoundFileWriter.h"
-#include "reference_host/aaf/stored/LittleEndian.h"
-#include "reference_host/aaf/stored/StoredError.h"
-#include "reference_host/aaf/stored/StoredFile.h"
-#include "reference_host/aaf/stored/TreeReader.h"
-#include "reference_host/aaf/stored/TreeWriter.h"
+#include "aaf_library/stored/CompoundFileWriter.h"
+#include "aaf_library/stored/LittleEndian.h"
+#include "aaf_library/stored/StoredError.h"
+#include "aaf_library/stored/StoredFile.h"
+#include "aaf_library/stored/TreeReader.h"
+#include "aaf_library/stored/TreeWriter.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>

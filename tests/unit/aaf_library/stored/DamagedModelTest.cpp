@@ -1,14 +1,14 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/stored/MetaPids.h"
+#include "aaf_library/stored/MetaRecords.h"
+#include "aaf_library/stored/ModelReader.h"
+#include "aaf_library/stored/ModelWriter.h"
+#include "aaf_library/stored/StoredError.h"
+#include "aaf_library/stored/TreeReader.h"
+#include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
-#include "reference_host/aaf/model/ClassDefinition.h"
-#include "reference_host/aaf/stored/MetaPids.h"
-#include "reference_host/aaf/stored/MetaRecords.h"
-#include "reference_host/aaf/stored/ModelReader.h"
-#include "reference_host/aaf/stored/ModelWriter.h"
-#include "reference_host/aaf/stored/StoredError.h"
-#include "reference_host/aaf/stored/TreeReader.h"
-#include "reference_host/aaf/stored/TreeWriter.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
 #include <gtest/gtest.h>

@@ -1,10 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/aaf/stored/CompoundFileReader.h"
-#include "reference_host/aaf/stored/MetaPids.h"
-#include "reference_host/aaf/stored/StoredError.h"
-#include "reference_host/aaf/stored/TreeReader.h"
-#include "reference_host/aaf/stored/TreeWriter.h"
+#include "aaf_library/stored/CompoundFileReader.h"
+#include "aaf_library/stored/MetaPids.h"
+#include "aaf_library/stored/StoredError.h"
+#include "aaf_library/stored/TreeReader.h"
+#include "aaf_library/stored/TreeWriter.h"
 #include "tests/unit/aaf_library/stored/BuiltInRecords.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 

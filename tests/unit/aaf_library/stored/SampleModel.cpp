@@ -2,12 +2,12 @@
 // SPDX-License-Identifier: MIT
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
+#include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/model/TypeDefinition.h"
+#include "aaf_library/stored/ModelTypes.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
-#include "reference_host/aaf/model/ClassDefinition.h"
-#include "reference_host/aaf/model/TypeDefinition.h"
-#include "reference_host/aaf/stored/ModelTypes.h"
 
 #include <stdexcept>
 

@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "reference_host/aaf/model/Dictionary.h"
-#include "reference_host/aaf/model/Model.h"
+#include "aaf_library/model/Dictionary.h"
+#include "aaf_library/model/Model.h"
 
 #include <string>
 

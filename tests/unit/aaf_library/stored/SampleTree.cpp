@@ -2,8 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
-#include "reference_host/aaf/stored/LittleEndian.h"
-#include "reference_host/aaf/stored/StoredFile.h"
+#include "aaf_library/stored/LittleEndian.h"
+#include "aaf_library/stored/StoredFile.h"
 
 #include <utility>
 

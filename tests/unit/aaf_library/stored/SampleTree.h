@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "reference_host/aaf/stored/StoredTree.h"
+#include "aaf_library/stored/StoredTree.h"
 
 #include <string>
 

@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/aaf/stored/StoredFile.h"
+#include "aaf_library/stored/StoredFile.h"
 
 #include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"

@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/aaf/stored/StoredNames.h"
+#include "aaf_library/stored/StoredNames.h"
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/aaf/stored/CompoundFileReader.h"
-#include "reference_host/aaf/stored/StoredFile.h"
-#include "reference_host/aaf/stored/StoredNames.h"
-#include "reference_host/aaf/stored/TreeReader.h"
-#include "reference_host/aaf/stored/TreeWriter.h"
+#include "aaf_library/stored/CompoundFileReader.h"
+#include "aaf_library/stored/StoredFile.h"
+#include "aaf_library/stored/StoredNames.h"
+#include "aaf_library/stored/TreeReader.h"
+#include "aaf_library/stored/TreeWriter.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>

@@ -1,0 +1,247 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/model/ClassDefinition.h"
+
+#include "aaf_library/model/Enumerator.h"
+#include "aaf_library/model/Model.h"
+#include "aaf_library/model/TypeDefinition.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
+
+namespace aaf {
+
+ClassDefinition::~ClassDefinition() {
+    for (const RefPtr<PropertyDefinition>& property : properties_) {
+        model()->ForgetProperty(*property);
+        property->Free();
+    }
+}
+
+bool ClassDefinition::IsKindOf(const GUID& classId) const {
+    for (const ClassDefinition* at = this; at != nullptr; at = at->parent_) {
+        if (at->id() == classId) {
+            return true;
+        }
+    }
+    return false;
+}
+
+PropertyDefinition* ClassDefinition::FindProperty(const GUID& id) const {
+    for (const ClassDefinition* at = this; at != nullptr; at = at->parent_) {
+        for (const RefPtr<PropertyDefinition>& property : at->properties_) {
+            if (property->id() == id) {
+                return property.get();
+            }
+        }
+    }
+    return nullptr;
+}
+
+PropertyDefinition* ClassDefinition::FindProperty(PropertyId pid) const {
+    for (const ClassDefinition* at = this; at != nullptr; at = at->parent_) {
+        for (const RefPtr<PropertyDefinition>& property : at->properties_) {
+            if (property->pid() == pid) {
+                return property.get();
+            }
+        }
+    }
+    return nullptr;
+}
+
+PropertyDefinition* ClassDefinition::FindUniqueProperty() const {
+    for (const ClassDefinition* at = this; at != nullptr; at = at->parent_) {
+        for (const RefPtr<PropertyDefinition>& property : at->properties_) {
+            if (property->IsUnique()) {
+                return property.get();
+            }
+        }
+    }
+    return nullptr;
+}
+
+PropertyDefinition& ClassDefinition::AddProperty(const GUID& id, const std::wstring& name,
+                                                 const GUID& typeId, bool optional, bool unique,
+                                                 PropertyId pid) {
+    RefPtr<PropertyDefinition> property(
+        new PropertyDefinition(*this, pid, typeId, optional, unique));
+    property->JoinModel(*model());
+    property->SetIdentity(id, name);
+    property->SetPid(model()->EnterProperty(*property));
+    property->Keep();
+    PropertyDefinition& added = *property;
+    properties_.push_back(std::move(property));
+    return added;
+}
+
+HRESULT ClassDefinition::Initialize(aafUID_constref classID, IAAFClassDef* parentClass,
+                                    aafCharacter_constptr className, aafBoolean_t isConcrete) {
+    if (!IsBoolean(isConcrete)) {
+        return AAFRESULT_INVALID_ENUM_VALUE;
+    }
+    auto* parent = ImplementationAs<ClassDefinition>(parentClass);
+    if (className == nullptr || parentClass == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (parent == nullptr || parent->model() != model()) {
+        return AAFRESULT_INVALID_OBJ;
+    }
+    const HRESULT result = SetIdentity(classID, className);
+    if (result >= 0) {
+        parent_ = parent;
+        concrete_ = isConcrete == kAAFTrue;
+    }
+    return result;
+}
+
+HRESULT ClassDefinition::GetPropertyDefs(IEnumAAFPropertyDefs** enumerator) {
+    return MakeEnumerator<IAAFPropertyDef>(
+        [self = RefPtr<ClassDefinition>(this)](std::size_t index) {
+            return index < self->properties_.size() ? RefPtr<Unknown>(self->properties_[index])
+                                                    : nullptr;
+        },
+        enumerator);
+}
+
+HRESULT ClassDefinition::CountPropertyDefs(aafUInt32* count) {
+    if (count == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    *count = static_cast<aafUInt32>(properties_.size());
+    return AAFRESULT_SUCCESS;
+}
+
+bool ClassDefinition::IsClosedToExtension() const {
+    // The meta model is fixed, but for the two kinds of type that may gain properties.
+    const bool meta = IsKindOf(AUID_AAFMetaDefinition) || IsKindOf(AUID_AAFMetaDictionary);
+    return meta && id() != AUID_AAFTypeDefRename && id() != AUID_AAFTypeDefExtEnum;
+}
+
+HRESULT ClassDefinition::RegisterProperty(const GUID& id, aafCharacter_constptr name,
+                                          IAAFTypeDef* typeDef, bool optional, bool unique,
+                                          IAAFPropertyDef** propDef) {
+    auto* type = ImplementationAs<TypeDefinition>(typeDef);
+    if (IsClosedToExtension()) {
+        return AAFRESULT_NOT_EXTENDABLE;
+    }
+    for (const RefPtr<PropertyDefinition>& property : properties_) {
+        if (property->id() == id) {
+            return AAFRESULT_INVALID_PARAM;
+        }
+    }
+    if (model()->HasProperty(id)) {
+        return AAFRESULT_PROPERTY_DUPLICATE;
+    }
+    if (type == nullptr || model()->FindType(type->id()) == nullptr) {
+        return AAFRESULT_NO_MORE_OBJECTS;
+    }
+    if (unique && FindUniqueProperty() != nullptr) {
+        return AAFRESULT_ALREADY_UNIQUELY_IDENTIFIED;
+    }
+    if (!model()->HasFreePropertyId()) {
+        return AAFRESULT_NOMEMORY;
+    }
+    PropertyDefinition& added = AddProperty(id, name, type->id(), optional, unique);
+    return propDef == nullptr ? AAFRESULT_SUCCESS : GiveOut(&added, propDef);
+}
+
+HRESULT ClassDefinition::RegisterNewPropertyDef(aafUID_constref id, aafCharacter_constptr name,
+                                                IAAFTypeDef* typeDef, aafBoolean_t isOptional,
+                                                aafBoolean_t isUniqueIdentifier,
+                                                IAAFPropertyDef** propDef) {
+    if (!IsBoolean(isOptional) || !IsBoolean(isUniqueIdentifier)) {
+        return AAFRESULT_INVALID_ENUM_VALUE;
+    }
+    if (propDef != nullptr) {
+        *propDef = nullptr;
+    }
+    if (name == nullptr || typeDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (!IsInitialized()) {
+        return AAFRESULT_NOT_INITIALIZED;
+    }
+    // Objects of a registered class exist already and would lack the property.
+    const bool required = isOptional == kAAFFalse;
+    if (registered_ && required && !IsClosedToExtension()) {
+        return AAFRESULT_OBJECT_ALREADY_ATTACHED;
+    }
+    return RegisterProperty(id, name, typeDef, !required, isUniqueIdentifier == kAAFTrue, propDef);
+}
+
+HRESULT ClassDefinition::RegisterOptionalPropertyDef(aafUID_constref id, aafCharacter_constptr name,
+                                                     IAAFTypeDef* typeDef,
+                                                     IAAFPropertyDef** propDef) {
+    if (propDef != nullptr) {
+        *propDef = nullptr;
+    }
+    if (name == nullptr || typeDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (!IsInitialized()) {
+        return AAFRESULT_NOT_INITIALIZED;
+    }
+    return RegisterProperty(id, name, typeDef, true, false, propDef);
+}
+
+HRESULT ClassDefinition::LookupPropertyDef(aafUID_constref propID, IAAFPropertyDef** propDef) {
+    if (propDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    PropertyDefinition* found = FindProperty(propID);
+    return found == nullptr ? AAFRESULT_NO_MORE_OBJECTS : GiveOut(found, propDef);
+}
+
+HRESULT ClassDefinition::GetName(aafCharacter* name, aafUInt32 bufSize) {
+    return MetaDefinition::GetName(name, bufSize);
+}
+
+HRESULT ClassDefinition::GetNameBufLen(aafUInt32* bufSize) {
+    return MetaDefinition::GetNameBufLen(bufSize);
+}
+
+HRESULT ClassDefinition::GetParent(IAAFClassDef** classDef) {
+    if (classDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    return parent_ == nullptr ? AAFRESULT_IS_ROOT_CLASS : GiveOut(parent_, classDef);
+}
+
+HRESULT ClassDefinition::IsConcrete(aafBoolean_t* result) {
+    if (result == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    *result = concrete_ ? kAAFTrue : kAAFFalse;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT ClassDefinition::IsRoot(aafBoolean_t* isRoot) {
+    if (isRoot == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    *isRoot = parent_ == nullptr ? kAAFTrue : kAAFFalse;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT ClassDefinition::IsUniquelyIdentified(aafBoolean_t* isUniquelyIdentified) {
+    if (isUniquelyIdentified == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    *isUniquelyIdentified = FindUniqueProperty() != nullptr ? kAAFTrue : kAAFFalse;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT ClassDefinition::GetUniqueIdentifier(IAAFPropertyDef** uniqueIdentifier) {
+    if (uniqueIdentifier == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    PropertyDefinition* found = FindUniqueProperty();
+    return found == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : GiveOut(found, uniqueIdentifier);
+}
+
+HRESULT ClassDefinition::CreateInstance(REFIID riid, IUnknown** object) {
+    if (object == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    return model()->CreateInstance(id(), riid, object);
+}
+
+}  // namespace aaf

@@ -1,0 +1,70 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <vector>
+
+#include "aaf_library/model/PropertyDefinition.h"
+#include "not_implemented/AAFMetaDefinitions.h"
+
+namespace aaf {
+
+// A class of the object model with its own properties. Kept by the model once
+// it is registered.
+class ClassDefinition : public Implements<MetaDefinition, IAAFClassDef> {
+public:
+    // Null for a root class.
+    ClassDefinition* parent() const { return parent_; }
+    void SetParent(ClassDefinition* parent) { parent_ = parent; }
+    bool concrete() const { return concrete_; }
+    void SetConcrete(bool concrete) { concrete_ = concrete; }
+    bool IsKindOf(const GUID& classId) const;
+    // In the dictionary, as opposed to being built by a caller.
+    bool IsRegistered() const { return registered_; }
+    void MarkRegistered() { registered_ = true; }
+
+    const std::vector<RefPtr<PropertyDefinition>>& properties() const { return properties_; }
+    // This class and its parents; null when unknown.
+    PropertyDefinition* FindProperty(const GUID& id) const;
+    PropertyDefinition* FindProperty(PropertyId pid) const;
+    PropertyDefinition* FindUniqueProperty() const;
+    // Adds without the checks that a caller's registration has. pid kNoPropertyId: the next free.
+    PropertyDefinition& AddProperty(const GUID& id, const std::wstring& name, const GUID& typeId,
+                                    bool optional, bool unique, PropertyId pid = kNoPropertyId);
+
+    // -- IAAFClassDef
+    HRESULT Initialize(aafUID_constref classID, IAAFClassDef* parentClass,
+                       aafCharacter_constptr className, aafBoolean_t isConcrete) override;
+    HRESULT GetPropertyDefs(IEnumAAFPropertyDefs** enumerator) override;
+    HRESULT CountPropertyDefs(aafUInt32* count) override;
+    HRESULT RegisterNewPropertyDef(aafUID_constref id, aafCharacter_constptr name,
+                                   IAAFTypeDef* typeDef, aafBoolean_t isOptional,
+                                   aafBoolean_t isUniqueIdentifier,
+                                   IAAFPropertyDef** propDef) override;
+    HRESULT RegisterOptionalPropertyDef(aafUID_constref id, aafCharacter_constptr name,
+                                        IAAFTypeDef* typeDef, IAAFPropertyDef** propDef) override;
+    HRESULT LookupPropertyDef(aafUID_constref propID, IAAFPropertyDef** propDef) override;
+    HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) override;
+    HRESULT GetNameBufLen(aafUInt32* bufSize) override;
+    HRESULT GetParent(IAAFClassDef** classDef) override;
+    HRESULT IsConcrete(aafBoolean_t* result) override;
+    HRESULT IsRoot(aafBoolean_t* isRoot) override;
+    HRESULT IsUniquelyIdentified(aafBoolean_t* isUniquelyIdentified) override;
+    HRESULT GetUniqueIdentifier(IAAFPropertyDef** uniqueIdentifier) override;
+    HRESULT CreateInstance(REFIID riid, IUnknown** object) override;
+
+protected:
+    ~ClassDefinition() override;
+
+private:
+    bool IsClosedToExtension() const;
+    HRESULT RegisterProperty(const GUID& id, aafCharacter_constptr name, IAAFTypeDef* typeDef,
+                             bool optional, bool unique, IAAFPropertyDef** propDef);
+
+    ClassDefinition* parent_ = nullptr;
+    bool concrete_ = false;
+    bool registered_ = false;
+    std::vector<RefPtr<PropertyDefinition>> properties_;
+};
+
+}  // namespace aaf

@@ -1,0 +1,150 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/model/DefinitionObjects.h"
+
+#include <algorithm>
+
+#include "aaf_library/model/Enumerator.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
+
+namespace aaf {
+
+GUID DefinitionObject::Identification() const {
+    GUID id{};
+    ReadStruct(prop::DefinitionObject_Identification, &id);
+    return id;
+}
+
+HRESULT DefinitionObject::InitializeDefinition(const GUID& id, aafCharacter_constptr name,
+                                               aafCharacter_constptr description) {
+    if (description == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = DefinitionObject::Initialize(id, name);
+    return result < 0 ? result : DefinitionObject::SetDescription(description);
+}
+
+HRESULT DefinitionObject::Initialize(aafUID_constref id, aafCharacter_constptr name) {
+    if (name == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    // A dictionary finds its definitions by id.
+    if (owner() != nullptr && Identification() != id) {
+        return AAFRESULT_OBJECT_ALREADY_ATTACHED;
+    }
+    PutStruct(prop::DefinitionObject_Identification, id);
+    return PutString(prop::DefinitionObject_Name, name);
+}
+
+HRESULT DefinitionObject::SetName(aafCharacter_constptr name) {
+    return PutString(prop::DefinitionObject_Name, name);
+}
+
+HRESULT DefinitionObject::GetName(aafCharacter* name, aafUInt32 bufSize) {
+    return ReadString(prop::DefinitionObject_Name, name, bufSize);
+}
+
+HRESULT DefinitionObject::GetNameBufLen(aafUInt32* bufSize) {
+    return ReadStringLength(prop::DefinitionObject_Name, bufSize);
+}
+
+HRESULT DefinitionObject::SetDescription(aafCharacter_constptr description) {
+    return PutString(prop::DefinitionObject_Description, description);
+}
+
+HRESULT DefinitionObject::GetDescription(aafCharacter* description, aafUInt32 bufSize) {
+    return ReadString(prop::DefinitionObject_Description, description, bufSize);
+}
+
+HRESULT DefinitionObject::GetDescriptionBufLen(aafUInt32* bufSize) {
+    return ReadStringLength(prop::DefinitionObject_Description, bufSize);
+}
+
+HRESULT DefinitionObject::GetAUID(aafUID_t* auid) {
+    return ReadStruct(prop::DefinitionObject_Identification, auid);
+}
+
+HRESULT ContainerDefinition::Initialize(aafUID_constref id, aafCharacter_constptr name,
+                                        aafCharacter_constptr description) {
+    return InitializeDefinition(id, name, description);
+}
+
+HRESULT ContainerDefinition::EssenceIsIdentified(aafBoolean_t* essenceIsIdentified) {
+    return ReadInteger(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified);
+}
+
+HRESULT ContainerDefinition::SetEssenceIsIdentified(aafBoolean_t essenceIsIdentified) {
+    return IsBoolean(essenceIsIdentified)
+               ? PutInteger(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified)
+               : AAFRESULT_INVALID_ENUM_VALUE;
+}
+
+HRESULT CodecDefinition::IsEssenceKindSupported(IAAFDataDef* essenceKind,
+                                                aafBoolean_t* isSupported) {
+    if (essenceKind == nullptr || isSupported == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const std::vector<Unknown*> kinds = WeakTargets(prop::CodecDefinition_DataDefinitions);
+    const bool found =
+        std::find(kinds.begin(), kinds.end(), ImplementationOf(essenceKind)) != kinds.end();
+    *isSupported = found ? kAAFTrue : kAAFFalse;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT CodecDefinition::AddEssenceKind(IAAFDataDef* essenceKind) {
+    return AppendWeak(prop::CodecDefinition_DataDefinitions, essenceKind);
+}
+
+HRESULT CodecDefinition::CountEssenceKinds(aafUInt32* result) {
+    if (result == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    *result = static_cast<aafUInt32>(WeakTargets(prop::CodecDefinition_DataDefinitions).size());
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT CodecDefinition::GetEssenceKinds(IEnumAAFDataDefs** enumerator) {
+    return MakeEnumerator<IAAFDataDef>(
+        [self = RefPtr<CodecDefinition>(this)](std::size_t index) {
+            const std::vector<Unknown*> kinds =
+                self->WeakTargets(prop::CodecDefinition_DataDefinitions);
+            return RefPtr<Unknown>(index < kinds.size() ? kinds[index] : nullptr);
+        },
+        enumerator);
+}
+
+HRESULT CodecDefinition::GetFileDescriptorClass(IAAFClassDef** cls) {
+    return ReadWeak(prop::CodecDefinition_FileDescriptorClass, cls);
+}
+
+HRESULT CodecDefinition::SetFileDescriptorClass(IAAFClassDef* cls) {
+    return PutWeak(prop::CodecDefinition_FileDescriptorClass, cls);
+}
+
+HRESULT ParameterDefinition::Initialize(aafUID_constref id, aafCharacter_constptr name,
+                                        aafCharacter_constptr description, IAAFTypeDef* type) {
+    if (type == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = InitializeDefinition(id, name, description);
+    return result < 0 ? result : PutWeak(prop::ParameterDefinition_Type, type);
+}
+
+HRESULT ParameterDefinition::GetTypeDefinition(IAAFTypeDef** typeDef) {
+    return ReadWeak(prop::ParameterDefinition_Type, typeDef);
+}
+
+HRESULT ParameterDefinition::SetDisplayUnits(aafCharacter_constptr displayUnits) {
+    return PutString(prop::ParameterDefinition_DisplayUnits, displayUnits);
+}
+
+HRESULT ParameterDefinition::GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) {
+    return ReadString(prop::ParameterDefinition_DisplayUnits, displayUnits, bufSize);
+}
+
+HRESULT ParameterDefinition::GetDisplayUnitsBufLen(aafUInt32* bufSize) {
+    return ReadStringLength(prop::ParameterDefinition_DisplayUnits, bufSize);
+}
+
+}  // namespace aaf

@@ -1,0 +1,110 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/model/Object.h"
+#include "not_implemented/AAFDefinitions.h"
+#include "not_implemented/AAFEffectDefinitions.h"
+#include "not_implemented/AAFPluginDefinitions.h"
+
+namespace aaf {
+
+// A definition of the dictionary: id, name and description.
+class DefinitionObject : public Implements<Object, IAAFDefObject> {
+public:
+    // Its id; all zero before it is initialised.
+    GUID Identification() const;
+
+    // -- IAAFDefObject
+    HRESULT SetName(aafCharacter_constptr name) override;
+    HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) override;
+    HRESULT GetNameBufLen(aafUInt32* bufSize) override;
+    HRESULT SetDescription(aafCharacter_constptr description) override;
+    HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) override;
+    HRESULT GetDescriptionBufLen(aafUInt32* bufSize) override;
+    HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name) override;
+    HRESULT GetAUID(aafUID_t* auid) override;
+
+protected:
+    HRESULT InitializeDefinition(const GUID& id, aafCharacter_constptr name,
+                                 aafCharacter_constptr description);
+};
+
+// The kinds of data that components hold. A legacy id and its newer counterpart
+// count as one kind.
+class DataDefinition
+    : public Implements<DefinitionObject, IAAFDataDef, IAAFDataDef2, IAAFDataDef3> {
+public:
+    // Equal ids, two ids of one kind, or picture with matte into picture.
+    static bool Converts(const GUID& from, const GUID& to);
+
+    // -- IAAFDataDef and its successors
+    HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
+                       aafCharacter_constptr description) override;
+    HRESULT IsPictureKind(aafBoolean_t* bIsPictureKind) override;
+    HRESULT IsMatteKind(aafBoolean_t* bIsMatteKind) override;
+    HRESULT IsPictureWithMatteKind(aafBoolean_t* bIsPictureWithMatteKind) override;
+    HRESULT IsSoundKind(aafBoolean_t* bIsSoundKind) override;
+    HRESULT DoesDataDefConvertTo(IAAFDataDef* id, aafBoolean_t* bDoesConvertTo) override;
+    HRESULT IsDataDefOf(IAAFDataDef* dataDef, aafBoolean_t* bIsDataDefOf) override;
+    HRESULT DoesDataDefConvertFrom(IAAFDataDef* dataDef, aafBoolean_t* bDoesConvertFrom) override;
+    HRESULT IsEdgecodeKind(aafBoolean_t* bIsEdgecodeKind) override;
+    HRESULT IsTimecodeKind(aafBoolean_t* bIsTimecodeKind) override;
+    HRESULT IsAuxiliaryKind(aafBoolean_t* bIsAuxiliaryKind) override;
+    HRESULT IsDescriptiveMetadataKind(aafBoolean_t* bIsDescriptiveMetadataKind) override;
+
+private:
+    HRESULT IsKind(const GUID& kind, aafBoolean_t* out) const;
+};
+
+// The wrapping of essence in files.
+class ContainerDefinition : public Implements<DefinitionObject, IAAFContainerDef> {
+public:
+    // -- IAAFContainerDef
+    HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
+                       aafCharacter_constptr description) override;
+    HRESULT EssenceIsIdentified(aafBoolean_t* essenceIsIdentified) override;
+    HRESULT SetEssenceIsIdentified(aafBoolean_t essenceIsIdentified) override;
+};
+
+// A definition of which only id, name and description are looked at.
+template <class Interface>
+class PlainDefinition : public Implements<DefinitionObject, Interface> {
+public:
+    HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
+                       aafCharacter_constptr description) override {
+        return this->InitializeDefinition(id, name, description);
+    }
+};
+
+using OperationDefinition = PlainDefinition<IAAFOperationDef>;
+using PluginDefinition = PlainDefinition<IAAFPluginDef>;
+using InterpolationDefinition = PlainDefinition<IAAFInterpolationDef>;
+using KLVDataDefinition = PlainDefinition<IAAFKLVDataDefinition>;
+using TaggedValueDefinition = PlainDefinition<IAAFTaggedValueDefinition>;
+
+// A codec: the descriptor class and the kinds of data that it serves.
+class CodecDefinition : public PlainDefinition<IAAFCodecDef> {
+public:
+    // -- IAAFCodecDef
+    HRESULT IsEssenceKindSupported(IAAFDataDef* essenceKind, aafBoolean_t* isSupported) override;
+    HRESULT AddEssenceKind(IAAFDataDef* essenceKind) override;
+    HRESULT CountEssenceKinds(aafUInt32* result) override;
+    HRESULT GetEssenceKinds(IEnumAAFDataDefs** enumerator) override;
+    HRESULT GetFileDescriptorClass(IAAFClassDef** cls) override;
+    HRESULT SetFileDescriptorClass(IAAFClassDef* cls) override;
+};
+
+// A parameter of effects, with its type.
+class ParameterDefinition : public Implements<DefinitionObject, IAAFParameterDef> {
+public:
+    // -- IAAFParameterDef
+    HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
+                       aafCharacter_constptr description, IAAFTypeDef* type) override;
+    HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) override;
+    HRESULT SetDisplayUnits(aafCharacter_constptr displayUnits) override;
+    HRESULT GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) override;
+    HRESULT GetDisplayUnitsBufLen(aafUInt32* bufSize) override;
+};
+
+}  // namespace aaf

@@ -1,0 +1,319 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/model/Model.h"
+
+#include <algorithm>
+
+#include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/model/Dictionary.h"
+#include "aaf_library/model/Text.h"
+#include "aaf_library/model/TypeFactory.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
+
+namespace aaf {
+
+namespace {
+
+// Classes of the meta model that a caller may make, by the kind of type.
+struct MetaClass {
+    const GUID& classId;
+    TypeKind kind;
+};
+
+const MetaClass kTypeClasses[] = {
+    {AUID_AAFTypeDefInt, TypeKind::Integer},
+    {AUID_AAFTypeDefStrongObjRef, TypeKind::StrongReference},
+    {AUID_AAFTypeDefWeakObjRef, TypeKind::WeakReference},
+    {AUID_AAFTypeDefEnum, TypeKind::Enumeration},
+    {AUID_AAFTypeDefFixedArray, TypeKind::FixedArray},
+    {AUID_AAFTypeDefVariableArray, TypeKind::VariableArray},
+    {AUID_AAFTypeDefSet, TypeKind::Set},
+    {AUID_AAFTypeDefString, TypeKind::String},
+    {AUID_AAFTypeDefStream, TypeKind::Stream},
+    {AUID_AAFTypeDefRecord, TypeKind::Record},
+    {AUID_AAFTypeDefRename, TypeKind::Rename},
+    {AUID_AAFTypeDefExtEnum, TypeKind::ExtendibleEnumeration},
+    {AUID_AAFTypeDefIndirect, TypeKind::Indirect},
+    {AUID_AAFTypeDefOpaque, TypeKind::Opaque},
+    {AUID_AAFTypeDefCharacter, TypeKind::Character},
+};
+
+// A file has exactly one of each, which comes with it.
+const GUID* const kMadeWithTheFile[] = {&AUID_AAFHeader, &AUID_AAFDictionary,
+                                        &AUID_AAFContentStorage};
+
+}  // namespace
+
+RefPtr<Model> Model::Create(const ClassRegistry& classes) {
+    RefPtr<Model> model(new Model(classes));
+    model->dictionary_ = model->NewObject<Dictionary>(AUID_AAFDictionary);
+    model->dictionary_->Keep();
+    model->dictionary_->OfferBuiltIn();
+    return model;
+}
+
+Model::Model(const ClassRegistry& classes) : registry_(classes) {}
+
+Model::~Model() {
+    // Nobody outside holds any of these now. Objects first, then what describes them.
+    if (dictionary_) {
+        dictionary_->Free();
+        dictionary_ = nullptr;
+    }
+    for (const RefPtr<ClassDefinition>& definition : classes_) {
+        definition->Free();
+    }
+    classes_.clear();
+    for (std::vector<RefPtr<TypeDefinition>>* list : {&types_, &keptTypes_}) {
+        for (const RefPtr<TypeDefinition>& type : *list) {
+            type->Free();
+        }
+        list->clear();
+    }
+}
+
+void Model::Release() {
+    if (--pins_ == 0 && !dying_) {
+        dying_ = true;
+        delete this;
+    }
+}
+
+// A new file lists some of the built-in definitions. They are made when the lists are first looked
+// at: most files are described without.
+void Model::ListStart() {
+    if (hasListedStart_) {
+        return;
+    }
+    hasListedStart_ = true;
+    std::unordered_map<GUID, std::size_t, GuidHash> places;
+    for (const BuiltInClass& entry : BuiltInClasses()) {
+        if (entry.listedAtStart) {
+            FindClass(entry.id);
+            places.emplace(entry.id, places.size());
+        }
+    }
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        if (entry.listedAtStart) {
+            FindType(entry.id);
+            places.emplace(entry.id, places.size());
+        }
+    }
+    const auto isBefore = [&places](const auto& left, const auto& right) {
+        const auto placeOf = [&places](const auto& definition) {
+            const auto found = places.find(definition->id());
+            return found == places.end() ? places.size() : found->second;
+        };
+        return placeOf(left) < placeOf(right);
+    };
+    std::stable_sort(classes_.begin(), classes_.end(), isBefore);
+    std::stable_sort(types_.begin(), types_.end(), isBefore);
+}
+
+const std::vector<RefPtr<ClassDefinition>>& Model::classes() {
+    ListStart();
+    return classes_;
+}
+
+const std::vector<RefPtr<TypeDefinition>>& Model::types() {
+    ListStart();
+    return types_;
+}
+
+RefPtr<Object> Model::CreateObject(ClassDefinition& definition, bool withDefaults) {
+    ObjectCreator create = nullptr;
+    for (const ClassDefinition* at = &definition; at != nullptr && create == nullptr;
+         at = at->parent()) {
+        create = registry_.Find(at->id());
+    }
+    if (create == nullptr) {
+        return nullptr;
+    }
+    RefPtr<Object> object(create());
+    object->JoinModel(*this);
+    object->SetClass(definition);
+    if (withDefaults) {
+        object->SetDefaults();
+    }
+    return object;
+}
+
+RefPtr<PropertyValue> Model::NewValue(TypeDefinition& type) {
+    KeepType(type);
+    RefPtr<PropertyValue> value(new PropertyValue(type));
+    value->JoinModel(*this);
+    type.FillEmpty(*value);
+    return value;
+}
+
+HRESULT Model::CreateInstance(const GUID& classId, const GUID& iid, IUnknown** out) {
+    ClassDefinition* definition = FindClass(classId);
+    if (definition == nullptr) {
+        return AAFRESULT_NO_MORE_OBJECTS;
+    }
+    if (!definition->concrete()) {
+        return AAFRESULT_ABSTRACT_CLASS;
+    }
+    for (const GUID* single : kMadeWithTheFile) {
+        if (classId == *single) {
+            return AAFRESULT_INVALID_CLASS_ID;
+        }
+    }
+    const RefPtr<Object> object = CreateObject(*definition);
+    return object ? object->QueryInterface(iid, reinterpret_cast<void**>(out))
+                  : AAFRESULT_INVALID_CLASS_ID;
+}
+
+HRESULT Model::CreateMetaInstance(const GUID& classId, const GUID& iid, IUnknown** out) {
+    const ClassDefinition* definition = FindClass(classId);
+    if (definition == nullptr) {
+        return AAFRESULT_NO_MORE_OBJECTS;
+    }
+    if (classId == AUID_AAFClassDef) {
+        RefPtr<ClassDefinition> made(new ClassDefinition);
+        made->JoinModel(*this);
+        return made->QueryInterface(iid, reinterpret_cast<void**>(out));
+    }
+    for (const MetaClass& entry : kTypeClasses) {
+        if (classId == entry.classId) {
+            const RefPtr<TypeDefinition> made = MakeType(entry.kind);
+            made->JoinModel(*this);
+            return made->QueryInterface(iid, reinterpret_cast<void**>(out));
+        }
+    }
+    const bool meta = definition->IsKindOf(AUID_AAFMetaDefinition);
+    return meta && !definition->concrete() ? AAFRESULT_ABSTRACT_CLASS : AAFRESULT_INVALID_CLASS_ID;
+}
+
+ClassDefinition& Model::Enter(RefPtr<ClassDefinition> definition) {
+    ClassDefinition& entered = *definition;
+    entered.MarkRegistered();
+    classById_[entered.id()] = &entered;
+    classes_.push_back(std::move(definition));
+    entered.Keep();
+    return entered;
+}
+
+TypeDefinition& Model::Enter(RefPtr<TypeDefinition> type) {
+    TypeDefinition& entered = *type;
+    typeById_[entered.id()] = &entered;
+    types_.push_back(std::move(type));
+    entered.Keep();
+    return entered;
+}
+
+ClassDefinition* Model::AddBuiltInClass(const BuiltInClass& entry) {
+    RefPtr<ClassDefinition> definition(new ClassDefinition);
+    definition->JoinModel(*this);
+    definition->MarkBuiltIn();
+    definition->SetIdentity(entry.id, Widen(entry.name));
+    definition->SetConcrete(entry.concrete);
+    if (entry.parent != entry.id) {
+        definition->SetParent(FindClass(entry.parent));
+    }
+    for (const BuiltInProperty& property : entry.properties) {
+        definition
+            ->AddProperty(property.id, Widen(property.name), property.type, property.optional,
+                          property.unique, property.pid)
+            .MarkBuiltIn();
+    }
+    return &Enter(std::move(definition));
+}
+
+ClassDefinition* Model::FindClass(const GUID& id) {
+    const auto found = classById_.find(id);
+    if (found != classById_.end()) {
+        return found->second;
+    }
+    const BuiltInClass* entry = FindBuiltInClass(id);
+    return entry == nullptr ? nullptr : AddBuiltInClass(*entry);
+}
+
+TypeDefinition* Model::FindType(const GUID& id) {
+    const auto found = typeById_.find(id);
+    if (found != typeById_.end()) {
+        return found->second;
+    }
+    const BuiltInType* entry = FindBuiltInType(id);
+    return entry == nullptr ? nullptr : &Enter(MakeBuiltInType(*this, *entry));
+}
+
+HRESULT Model::RegisterClass(ClassDefinition& definition) {
+    if (!definition.IsInitialized()) {
+        return AAFRESULT_NOT_INITIALIZED;
+    }
+    if (definition.IsRegistered()) {
+        return AAFRESULT_OBJECT_ALREADY_ATTACHED;
+    }
+    if (FindClass(definition.id()) != nullptr) {
+        return AAFRESULT_SUCCESS;
+    }
+    Enter(RefPtr<ClassDefinition>(&definition));
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT Model::RegisterType(TypeDefinition& type) {
+    if (!type.IsInitialized()) {
+        return AAFRESULT_NOT_INITIALIZED;
+    }
+    if (FindType(type.id()) != nullptr) {
+        return AAFRESULT_SUCCESS;
+    }
+    Enter(RefPtr<TypeDefinition>(&type));
+    // One reference of the model's is enough, a second would look like a caller's.
+    const auto kept =
+        std::find_if(keptTypes_.begin(), keptTypes_.end(),
+                     [&](const RefPtr<TypeDefinition>& at) { return at.get() == &type; });
+    if (kept != keptTypes_.end()) {
+        keptTypes_.erase(kept);
+    }
+    return AAFRESULT_SUCCESS;
+}
+
+bool Model::Holds(const TypeDefinition& type) const {
+    const auto found = typeById_.find(type.id());
+    return found != typeById_.end() && found->second == &type;
+}
+
+void Model::KeepType(TypeDefinition& type) {
+    if (!type.IsKept()) {
+        keptTypes_.emplace_back(&type);
+        type.Keep();
+    }
+}
+
+PropertyDefinition* Model::FindProperty(const GUID& id) const {
+    const auto found = propertyById_.find(id);
+    return found == propertyById_.end() ? nullptr : found->second;
+}
+
+bool Model::HasProperty(const GUID& id) const {
+    return FindProperty(id) != nullptr || FindBuiltInProperty(id) != nullptr;
+}
+
+PropertyId Model::EnterProperty(PropertyDefinition& property) {
+    propertyById_[property.id()] = &property;
+    return property.pid() != kNoPropertyId ? property.pid() : nextPropertyId_--;
+}
+
+void Model::ForgetProperty(PropertyDefinition& property) {
+    const auto found = propertyById_.find(property.id());
+    if (found != propertyById_.end() && found->second == &property) {
+        propertyById_.erase(found);
+    }
+}
+
+Unknown* Model::FindTarget(const GUID& classId, const GUID& id) {
+    if (classId == AUID_AAFClassDef) {
+        return FindClass(id);
+    }
+    if (classId == AUID_AAFTypeDef) {
+        return FindType(id);
+    }
+    if (classId == AUID_AAFPropertyDef) {
+        return FindProperty(id);
+    }
+    return dictionary_->FindDefinition(classId, id);
+}
+
+}  // namespace aaf

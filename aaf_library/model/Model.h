@@ -1,0 +1,111 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <memory>
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+#include "aaf_library/model/BuiltIn.h"
+#include "aaf_library/model/ClassRegistry.h"
+#include "aaf_library/model/Object.h"
+
+namespace aaf {
+
+class ClassDefinition;
+class Dictionary;
+class MetaDefinition;
+class PropertyDefinition;
+class TypeDefinition;
+
+// The world of one file: its class, property and type definitions, and its
+// dictionary. Built-in definitions come into being when they are first looked up.
+//
+// Held by RefPtr; lives while anyone holds it or pins it through one of its
+// objects (see Unknown).
+class Model {
+public:
+    // With the built-in data and container definitions.
+    static RefPtr<Model> Create(const ClassRegistry& classes);
+
+    Model(const Model&) = delete;
+    Model& operator=(const Model&) = delete;
+    void AddRef() { ++pins_; }
+    void Release();
+
+    Dictionary& dictionary() const { return *dictionary_; }
+
+    // -- Making objects. Free, with no reference but the returned one.
+    RefPtr<Object> CreateObject(ClassDefinition& definition, bool withDefaults = true);
+    template <class T>
+    RefPtr<T> NewObject(const GUID& classId) {
+        ClassDefinition* definition = FindClass(classId);
+        RefPtr<Object> object = definition == nullptr ? nullptr : CreateObject(*definition);
+        return RefPtr<T>(dynamic_cast<T*>(object.get()));
+    }
+    // A value of this type, empty.
+    RefPtr<PropertyValue> NewValue(TypeDefinition& type);
+    // What IAAFDictionary::CreateInstance and IAAFClassDef::CreateInstance do.
+    HRESULT CreateInstance(const GUID& classId, const GUID& iid, IUnknown** out);
+    HRESULT CreateMetaInstance(const GUID& classId, const GUID& iid, IUnknown** out);
+    // A deep copy of an object of any model, free, with the definitions that it needs. Definitions
+    // of properties and types which this model lacks are registered here.
+    RefPtr<Object> CopyObject(const Object& source);
+
+    // -- Meta-dictionary. Null when unknown.
+    ClassDefinition* FindClass(const GUID& id);
+    TypeDefinition* FindType(const GUID& id);
+    // The definitions listed so far: those that a new file lists, then the others in the order in
+    // which they came into being.
+    const std::vector<RefPtr<ClassDefinition>>& classes();
+    const std::vector<RefPtr<TypeDefinition>>& types();
+    // Adds a definition that a caller made; one whose id exists stays outside, silently for types.
+    HRESULT RegisterClass(ClassDefinition& definition);
+    HRESULT RegisterType(TypeDefinition& type);
+    bool Holds(const TypeDefinition& type) const;
+    // Keeps a type that values refer to although it is not registered.
+    void KeepType(TypeDefinition& type);
+    // Any registered property, by its id.
+    PropertyDefinition* FindProperty(const GUID& id) const;
+    // Whether any class has a property with that id, looked up yet or not.
+    bool HasProperty(const GUID& id) const;
+    // False once all numbers are allotted.
+    bool HasFreePropertyId() const { return nextPropertyId_ >= 0x8000; }
+    // By PropertyDefinitions as they come into being: their number, allotted when it is 0.
+    PropertyId EnterProperty(PropertyDefinition& property);
+    void ForgetProperty(PropertyDefinition& property);
+    // When reading a file whose numbers are its own: look up by id, never by number.
+
+    // -- Weak references: the target of class `classId` with that id, or null.
+    Unknown* FindTarget(const GUID& classId, const GUID& id);
+
+private:
+    explicit Model(const ClassRegistry& classes);
+    ~Model();
+    void ListStart();
+    ClassDefinition* AddBuiltInClass(const BuiltInClass& entry);
+    ClassDefinition& Enter(RefPtr<ClassDefinition> definition);
+    TypeDefinition& Enter(RefPtr<TypeDefinition> type);
+    // The counterparts in this model of what another model has.
+    ClassDefinition* ClassLike(const ClassDefinition& source);
+    TypeDefinition* TypeLike(const TypeDefinition& source);
+    PropertyDefinition* PropertyLike(ClassDefinition& owner, const PropertyDefinition& source);
+    void CopyReferredTo(const PropertyValue& value);
+    HRESULT CopyValue(const PropertyValue& source, Object& target, PropertyDefinition& property);
+
+    const ClassRegistry& registry_;
+    std::size_t pins_ = 0;
+    bool dying_ = false;
+    bool hasListedStart_ = false;
+    std::vector<RefPtr<ClassDefinition>> classes_;
+    std::vector<RefPtr<TypeDefinition>> types_;
+    std::vector<RefPtr<TypeDefinition>> keptTypes_;
+    std::unordered_map<GUID, ClassDefinition*, GuidHash> classById_;
+    std::unordered_map<GUID, TypeDefinition*, GuidHash> typeById_;
+    std::unordered_map<GUID, PropertyDefinition*, GuidHash> propertyById_;
+    PropertyId nextPropertyId_ = 0xFFFF;
+    RefPtr<Dictionary> dictionary_;
+};
+
+}  // namespace aaf

@@ -1,0 +1,30 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+
+#include "aaf_library/model/PropertyValue.h"
+#include "host_interfaces/aaf/AAFPlainTypes.h"
+
+// Texts: wide characters in the calls, UTF-16 without regard to the machine in
+// stored values. A lone surrogate is carried as it stands.
+
+namespace aaf {
+
+void AppendUtf16(const aafCharacter* text, std::size_t count, Bytes& out);
+std::wstring FromUtf16(const std::uint8_t* bytes, std::size_t size);
+
+// Stored form of a text with its terminating zero.
+Bytes StoredText(const std::wstring& text);
+// Text up to the first zero, if there is one.
+std::wstring TextOfStored(const Bytes& bytes);
+
+// Text of one of the constant tables, which are plain ASCII.
+std::wstring Widen(const char* ascii);
+
+// Answers of the operations that hand out a text: bytes include the zero.
+HRESULT CopyText(const std::wstring& text, aafCharacter* buffer, aafUInt32 bufferBytes);
+HRESULT TextSize(const std::wstring& text, aafUInt32* bytes);
+
+}  // namespace aaf

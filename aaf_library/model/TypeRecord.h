@@ -1,0 +1,66 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/model/TypeDefinition.h"
+#include "not_implemented/AAFTypeDefinitions.h"
+
+namespace aaf {
+
+// Members of fixed size, one after the other when stored. The layout of the
+// caller's structure is registered apart; until then only values go in and out.
+class TypeRecord : public Implements<TypeDefinition, IAAFTypeDefRecord> {
+public:
+    struct Member {
+        std::wstring name;
+        TypeDefinition* type;
+    };
+
+    TypeRecord() : Implements(TypeKind::Record) {}
+
+    HRESULT Setup(const GUID& id, const std::wstring& name, std::vector<Member> members);
+    // The layout that a C structure with these members has.
+    void UseNaturalLayout();
+    // That of another record with the same members.
+    void UseLayoutOf(const TypeRecord& other);
+    const std::vector<Member>& members() const { return members_; }
+
+    std::size_t StoredSize() const override { return storedSize_; }
+    std::size_t NativeSize() const override { return nativeSize_; }
+    void AppendStored(const std::uint8_t* native, Bytes& out) const override;
+    void CopyNative(const std::uint8_t* stored, std::uint8_t* native) const override;
+
+    // -- IAAFTypeDefRecord
+    HRESULT Initialize(aafUID_constref id, IAAFTypeDef** memberTypes, aafString_t* memberNames,
+                       aafUInt32 numMembers, aafCharacter_constptr typeName) override;
+    HRESULT GetMemberType(aafUInt32 index, IAAFTypeDef** typeDef) override;
+    HRESULT GetMemberName(aafUInt32 index, aafCharacter* name, aafUInt32 bufSize) override;
+    HRESULT GetMemberNameBufLen(aafUInt32 index, aafUInt32* len) override;
+    HRESULT CreateValueFromValues(IAAFPropertyValue** memberValues, aafUInt32 numMembers,
+                                  IAAFPropertyValue** propVal) override;
+    HRESULT CreateValueFromStruct(aafMemPtr_t initData, aafUInt32 initDataSize,
+                                  IAAFPropertyValue** propVal) override;
+    HRESULT GetValue(IAAFPropertyValue* inPropVal, aafUInt32 index,
+                     IAAFPropertyValue** outPropVal) override;
+    HRESULT GetStruct(IAAFPropertyValue* propVal, aafMemPtr_t data, aafUInt32 dataSize) override;
+    HRESULT SetValue(IAAFPropertyValue* propVal, aafUInt32 index,
+                     IAAFPropertyValue* memberPropVal) override;
+    HRESULT SetStruct(IAAFPropertyValue* propVal, aafMemPtr_t data, aafUInt32 dataSize) override;
+    HRESULT GetCount(aafUInt32* count) override;
+    HRESULT RegisterMembers(aafUInt32* offsets, aafUInt32 numMembers,
+                            aafUInt32 structSize) override;
+
+private:
+    // Whether the caller's structure of that size can be read or written.
+    HRESULT CheckStruct(aafUInt32 dataSize) const;
+    bool LayoutFits() const;
+    HRESULT CheckMember(aafUInt32 index) const;
+    std::size_t StoredOffset(aafUInt32 index) const;
+
+    std::vector<Member> members_;
+    std::vector<std::size_t> offsets_;  // in the caller's structure
+    std::size_t storedSize_ = 0;
+    std::size_t nativeSize_ = 0;  // 0: no layout yet
+};
+
+}  // namespace aaf

@@ -1,0 +1,170 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/model/TypeStream.h"
+
+#include <algorithm>
+
+namespace aaf {
+
+namespace {
+
+constexpr std::uint8_t kUnspecified = 0x55;
+constexpr std::uint8_t kLittle = 0x4C;
+constexpr std::uint8_t kBig = 0x42;
+
+// Streams live in memory; a size beyond this is a mistake of the caller.
+constexpr aafInt64 kLargestStream = aafInt64{1} << 40;
+
+}  // namespace
+
+HRESULT TypeStream::GetSize(IAAFPropertyValue* streamPropertyValue, aafInt64* size) {
+    PropertyValue* value = nullptr;
+    if (size == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = Take(streamPropertyValue, &value);
+    if (result >= 0) {
+        *size = static_cast<aafInt64>(value->bytes().size());
+    }
+    return result;
+}
+
+HRESULT TypeStream::SetSize(IAAFPropertyValue* streamPropertyValue, aafInt64 newSize) {
+    PropertyValue* value = nullptr;
+    if (const HRESULT result = Take(streamPropertyValue, &value); result < 0) {
+        return result;
+    }
+    if (newSize < 0 || newSize > kLargestStream) {
+        return AAFRESULT_BAD_SIZE;
+    }
+    value->BytesToChange().resize(static_cast<std::size_t>(newSize));
+    value->SetPosition(std::min<std::uint64_t>(value->position(), value->bytes().size()));
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::GetPosition(IAAFPropertyValue* streamPropertyValue, aafInt64* position) {
+    PropertyValue* value = nullptr;
+    if (position == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = Take(streamPropertyValue, &value);
+    if (result >= 0) {
+        *position = static_cast<aafInt64>(value->position());
+    }
+    return result;
+}
+
+HRESULT TypeStream::SetPosition(IAAFPropertyValue* streamPropertyValue, aafInt64 newPosition) {
+    PropertyValue* value = nullptr;
+    if (const HRESULT result = Take(streamPropertyValue, &value); result < 0) {
+        return result;
+    }
+    if (newPosition < 0 || static_cast<std::uint64_t>(newPosition) > value->bytes().size()) {
+        return AAFRESULT_INVALID_PARAM;
+    }
+    value->SetPosition(static_cast<std::uint64_t>(newPosition));
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::Read(IAAFPropertyValue* streamPropertyValue, aafUInt32 dataSize,
+                         aafMemPtr_t data, aafUInt32* bytesRead) {
+    PropertyValue* value = nullptr;
+    if (data == nullptr || bytesRead == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (const HRESULT result = Take(streamPropertyValue, &value); result < 0) {
+        return result;
+    }
+    const auto position = static_cast<std::size_t>(value->position());
+    const std::size_t count = std::min<std::size_t>(dataSize, value->bytes().size() - position);
+    if (count > 0) {
+        std::memcpy(data, value->bytes().data() + position, count);
+    }
+    value->SetPosition(position + count);
+    *bytesRead = static_cast<aafUInt32>(count);
+    return count == 0 && dataSize > 0 ? AAFRESULT_END_OF_DATA : AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::Write(IAAFPropertyValue* streamPropertyValue, aafUInt32 dataSize,
+                          aafMemPtr_t data) {
+    PropertyValue* value = nullptr;
+    if (data == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (const HRESULT result = Take(streamPropertyValue, &value); result < 0) {
+        return result;
+    }
+    const auto position = static_cast<std::size_t>(value->position());
+    value->BytesToChange().resize(
+        std::max<std::size_t>(value->bytes().size(), position + dataSize));
+    std::copy_n(data, dataSize,
+                value->BytesToChange().begin() + static_cast<std::ptrdiff_t>(position));
+    value->SetPosition(position + dataSize);
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::Append(IAAFPropertyValue* streamPropertyValue, aafUInt32 dataSize,
+                           aafMemPtr_t data) {
+    PropertyValue* value = nullptr;
+    if (data == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (const HRESULT result = Take(streamPropertyValue, &value); result < 0) {
+        return result;
+    }
+    value->SetPosition(value->bytes().size());
+    return Write(streamPropertyValue, dataSize, data);
+}
+
+HRESULT TypeStream::HasStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
+                                       aafBoolean_t* hasByteOrder) {
+    PropertyValue* value = nullptr;
+    if (hasByteOrder == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = Take(streamPropertyValue, &value);
+    if (result >= 0) {
+        *hasByteOrder = value->streamByteOrder() == kUnspecified ? kAAFFalse : kAAFTrue;
+    }
+    return result;
+}
+
+HRESULT TypeStream::GetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
+                                       eAAFByteOrder_t* byteOrder) {
+    PropertyValue* value = nullptr;
+    if (byteOrder == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (const HRESULT result = Take(streamPropertyValue, &value); result < 0) {
+        return result;
+    }
+    if (value->streamByteOrder() == kUnspecified) {
+        return AAFRESULT_NOBYTEORDER;
+    }
+    *byteOrder = value->streamByteOrder() == kBig ? kAAFByteOrderBig : kAAFByteOrderLittle;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::SetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
+                                       eAAFByteOrder_t byteOrder) {
+    PropertyValue* value = nullptr;
+    if (byteOrder != kAAFByteOrderLittle && byteOrder != kAAFByteOrderBig) {
+        return AAFRESULT_INVALID_ENUM_VALUE;
+    }
+    const HRESULT result = Take(streamPropertyValue, &value);
+    if (result >= 0) {
+        value->SetStreamByteOrder(byteOrder == kAAFByteOrderBig ? kBig : kLittle);
+    }
+    return result;
+}
+
+HRESULT TypeStream::ClearStoredByteOrder(IAAFPropertyValue* streamPropertyValue) {
+    PropertyValue* value = nullptr;
+    const HRESULT result = Take(streamPropertyValue, &value);
+    if (result >= 0) {
+        value->SetStreamByteOrder(kUnspecified);
+    }
+    return result;
+}
+
+}  // namespace aaf

@@ -1,0 +1,273 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/objects/File.h"
+
+#include "aaf_library/model/Dictionary.h"
+#include "aaf_library/objects/ContentStorage.h"
+#include "aaf_library/objects/Extensions.h"
+#include "aaf_library/objects/Listeners.h"
+#include "aaf_library/objects/Mob.h"
+#include "aaf_library/objects/ObjectClasses.h"
+#include "aaf_library/objects/Paths.h"
+#include "aaf_library/stored/ModelFile.h"
+#include "aaf_library/stored/ModelWriter.h"
+#include "aaf_library/stored/StoredError.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFExports.h"
+
+namespace aaf {
+
+namespace {
+
+constexpr aafUInt32 kKnownFlags =
+    AAF_FILE_MODE_LAZY_LOADING | AAF_FILE_MODE_REVERTABLE | AAF_FILE_MODE_UNBUFFERED |
+    AAF_FILE_MODE_RECLAIMABLE | AAF_FILE_MODE_USE_LARGE_SS_SECTORS | AAF_FILE_MODE_CLOSE_FAIL_DIRTY;
+
+struct FailureCode {
+    stored::FileFailure failure;
+    HRESULT code;
+};
+
+// What a failure of the stored form is called at the interfaces. Access is
+// refused to a reader or to a writer; the caller tells which.
+constexpr FailureCode kFailureCodes[] = {
+    {stored::FileFailure::NotThere, AAFRESULT_FILE_NOT_FOUND},
+    {stored::FileFailure::NotAaf, AAFRESULT_NOT_AAF_FILE},
+    {stored::FileFailure::Damaged, AAFRESULT_READ_FAILURE},
+    {stored::FileFailure::NotStorable, AAFRESULT_INVALID_OBJ},
+    {stored::FileFailure::NoMemory, AAFRESULT_NOMEMORY},
+};
+
+HRESULT ResultOf(const stored::FileResult& result, HRESULT noAccess) {
+    if (result) {
+        return AAFRESULT_SUCCESS;
+    }
+    TellDiagnostic(result.message);
+    for (const FailureCode& entry : kFailureCodes) {
+        if (entry.failure == result.failure) {
+            return entry.code;
+        }
+    }
+    return noAccess;
+}
+
+HRESULT CheckFlags(aafUInt32 modeFlags) {
+    return (modeFlags & ~kKnownFlags) == 0 ? AAFRESULT_SUCCESS : AAFRESULT_BAD_FLAGS;
+}
+
+}  // namespace
+
+HRESULT File::OpenTransient(const aafProductIdentification_t* product, IAAFFile** file) {
+    if (product == nullptr || file == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const RefPtr<File> made(new File);
+    const HRESULT result = made->MakeNew(product);
+    return result < 0 ? result : GiveOut(made.get(), file);
+}
+
+HRESULT File::OpenNew(aafCharacter_constptr path, const aafUID_t& kind, aafUInt32 modeFlags,
+                      const aafProductIdentification_t* product, IAAFFile** file) {
+    if (path == nullptr || product == nullptr || file == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    HRESULT result = CheckFlags(modeFlags);
+    if (result < 0) {
+        return result;
+    }
+    if (kind != kAAFFileKind_Aaf512Binary && kind != kAAFFileKind_Aaf4KBinary &&
+        kind != kAAFFileKind_DontCare) {
+        return AAFRESULT_FILEKIND_NOT_REGISTERED;
+    }
+    const RefPtr<File> made(new File);
+    made->access_ = Access::Write;
+    made->path_ = PathOf(path);
+    made->largeSectors_ =
+        kind == kAAFFileKind_Aaf4KBinary ||
+        (kind == kAAFFileKind_DontCare && (modeFlags & AAF_FILE_MODE_USE_LARGE_SS_SECTORS) != 0);
+    made->failsUnsaved_ = (modeFlags & AAF_FILE_MODE_CLOSE_FAIL_DIRTY) != 0;
+    result = made->MakeNew(product);
+    return result < 0 ? result : GiveOut(made.get(), file);
+}
+
+HRESULT File::OpenToRead(aafCharacter_constptr path, aafUInt32 modeFlags, IAAFFile** file) {
+    if (path == nullptr || file == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const RefPtr<File> made(new File);
+    made->access_ = Access::Read;
+    const HRESULT result = made->Load(path, modeFlags);
+    return result < 0 ? result : GiveOut(made.get(), file);
+}
+
+HRESULT File::OpenToModify(aafCharacter_constptr path, aafUInt32 modeFlags,
+                           const aafProductIdentification_t* product, IAAFFile** file) {
+    if (path == nullptr || product == nullptr || file == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const RefPtr<File> made(new File);
+    made->access_ = Access::Write;
+    HRESULT result = made->Load(path, modeFlags);
+    if (result >= 0) {
+        result = made->header_->AddIdentification(*product);
+    }
+    return result < 0 ? result : GiveOut(made.get(), file);
+}
+
+HRESULT File::MakeNew(const aafProductIdentification_t* product) {
+    model_ = Model::Create(ObjectClasses());
+    const RefPtr<Header> header = model_->NewObject<Header>(AUID_AAFHeader);
+    const HRESULT result = header->AddIdentification(*product);
+    if (result >= 0) {
+        header_ = header;
+    }
+    return result;
+}
+
+HRESULT File::Load(aafCharacter_constptr path, aafUInt32 modeFlags) {
+    HRESULT result = CheckFlags(modeFlags);
+    if (result < 0) {
+        return result;
+    }
+    path_ = PathOf(path);
+    failsUnsaved_ = (modeFlags & AAF_FILE_MODE_CLOSE_FAIL_DIRTY) != 0;
+    saved_ = true;
+    model_ = Model::Create(ObjectClasses());
+    RefPtr<Object> read;
+    result = ResultOf(stored::loadModel(path_, *model_, read), AAFRESULT_NOT_READABLE);
+    if (result < 0) {
+        return result;
+    }
+    const RefPtr<Header> header(dynamic_cast<Header*>(read.get()));
+    if (!header || header->content() == nullptr) {
+        return AAFRESULT_BADHEAD;
+    }
+    stored::SectorSize sectors{};
+    largeSectors_ = stored::isAafFile(path_, &sectors) && sectors == stored::SectorSize::Bytes4096;
+    header_ = header;
+    return AAFRESULT_SUCCESS;
+}
+
+ContentStorage* File::OpenStorage() const {
+    return IsOpen() ? header_->content() : nullptr;
+}
+
+HRESULT File::Open() {
+    return AAFRESULT_ALREADY_OPEN;
+}
+
+HRESULT File::GetHeader(IAAFHeader** header) {
+    if (header == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    return IsOpen() ? GiveOut(header_.get(), header) : AAFRESULT_NOT_OPEN;
+}
+
+HRESULT File::GetDictionary(IAAFDictionary** dictionary) {
+    if (dictionary == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    return IsOpen() ? GiveOut(&model_->dictionary(), dictionary) : AAFRESULT_NOT_OPEN;
+}
+
+HRESULT File::GetRevision(aafFileRev_t* rev) {
+    if (rev == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (!IsOpen()) {
+        return AAFRESULT_NOT_OPEN;
+    }
+    *rev = kAAFRev2;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT File::Save() {
+    if (!IsOpen()) {
+        return AAFRESULT_NOT_OPEN;
+    }
+    if (access_ == Access::Read) {
+        return AAFRESULT_WRONG_OPENMODE;
+    }
+    header_->Touch();
+    TellProgress();
+    HRESULT result = AAFRESULT_SUCCESS;
+    if (access_ == Access::Transient) {
+        // Nothing is written, but what could not be written is told.
+        try {
+            stored::treeOfModel(*model_, *header_);
+        } catch (const stored::StoredError& problem) {
+            TellDiagnostic(problem.what());
+            result = AAFRESULT_INVALID_OBJ;
+        }
+    } else {
+        const auto sectors =
+            largeSectors_ ? stored::SectorSize::Bytes4096 : stored::SectorSize::Bytes512;
+        result =
+            ResultOf(stored::saveModel(*model_, *header_, path_, sectors), AAFRESULT_NOT_WRITEABLE);
+    }
+    saved_ = result >= 0;
+    TellProgress();
+    return result;
+}
+
+HRESULT File::Close() {
+    if (!IsOpen()) {
+        return AAFRESULT_NOT_OPEN;
+    }
+    if (failsUnsaved_ && access_ == Access::Write && !saved_) {
+        return AAFRESULT_UNSAVED_CHANGES;
+    }
+    header_ = nullptr;
+    model_ = nullptr;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT File::SaveCopyAs(IAAFFile* destFile) {
+    if (destFile == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    File* const target = ImplementationAs<File>(destFile);
+    if (target == nullptr) {
+        return AAFRESULT_INVALID_OBJ;
+    }
+    if (!IsOpen() || !target->IsOpen()) {
+        return AAFRESULT_NOT_OPEN;
+    }
+    if (target->access_ == Access::Read) {
+        return AAFRESULT_WRONG_OPENMODE;
+    }
+    if (OpenStorage() == nullptr || target->OpenStorage() == nullptr) {
+        return AAFRESULT_OBJECT_NOT_FOUND;
+    }
+    if (target == this || target->OpenStorage()->MobCount() > 0) {
+        return AAFRESULT_OPERATION_NOT_PERMITTED;
+    }
+    const HRESULT result = CopyContentTo(*target);
+    return result < 0 ? result : target->Save();
+}
+
+HRESULT File::CopyContentTo(File& target) {
+    const ContentStorage& from = *OpenStorage();
+    ContentStorage& to = *target.OpenStorage();
+    HRESULT result = CopyExtensions(*model_, *target.model_);
+    for (aafUInt32 at = 0; result >= 0 && at < from.MobCount(); ++at) {
+        RefPtr<Mob> copy;
+        const Mob* const mob = from.MobAt(at);
+        result = mob == nullptr ? AAFRESULT_INVALID_OBJ : to.AddCopy(*mob, true, copy);
+    }
+    if (result < 0) {
+        // The target takes all or nothing.
+        while (to.MobCount() > 0) {
+            to.RemoveObjectAt(prop::ContentStorage_Mobs, 0);
+        }
+        return result;
+    }
+    aafUID_t pattern{};
+    if (header_->GetOperationalPattern(&pattern) >= 0) {
+        target.header_->SetOperationalPattern(pattern);
+    }
+    return result;
+}
+
+}  // namespace aaf

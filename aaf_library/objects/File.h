@@ -1,0 +1,58 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+
+#include "aaf_library/model/Model.h"
+#include "aaf_library/objects/Header.h"
+#include "host_interfaces/aaf/AAFFile.h"
+#include "not_implemented/AAFFile.h"
+
+namespace aaf {
+
+class ContentStorage;
+
+// A file: a model with a header, and, unless it is transient, the path that it
+// is saved to. It is open from the start; once closed it stays closed. What a
+// caller still holds of its objects lives on.
+class File : public Implements<Unknown, IAAFFile> {
+public:
+    static HRESULT OpenTransient(const aafProductIdentification_t* product, IAAFFile** file);
+    // The file comes into being when it is saved, in place of one that is there.
+    static HRESULT OpenNew(aafCharacter_constptr path, const aafUID_t& kind, aafUInt32 modeFlags,
+                           const aafProductIdentification_t* product, IAAFFile** file);
+    static HRESULT OpenToRead(aafCharacter_constptr path, aafUInt32 modeFlags, IAAFFile** file);
+    static HRESULT OpenToModify(aafCharacter_constptr path, aafUInt32 modeFlags,
+                                const aafProductIdentification_t* product, IAAFFile** file);
+
+    // The content of an open file, else null.
+    ContentStorage* OpenStorage() const;
+
+    HRESULT Open() override;
+    HRESULT SaveCopyAs(IAAFFile* destFile) override;
+    HRESULT GetHeader(IAAFHeader** header) override;
+    HRESULT GetRevision(aafFileRev_t* rev) override;
+    HRESULT Save() override;
+    HRESULT Close() override;
+    HRESULT GetDictionary(IAAFDictionary** dictionary) override;
+
+private:
+    enum class Access { Transient, Read, Write };
+
+    File() = default;
+    bool IsOpen() const { return static_cast<bool>(header_); }
+    HRESULT MakeNew(const aafProductIdentification_t* product);
+    HRESULT Load(aafCharacter_constptr path, aafUInt32 modeFlags);
+    HRESULT CopyContentTo(File& target);
+
+    RefPtr<Model> model_;
+    RefPtr<Header> header_;
+    Access access_ = Access::Transient;
+    std::filesystem::path path_;
+    bool largeSectors_ = false;
+    bool failsUnsaved_ = false;  // Close fails while there is something to save
+    bool saved_ = false;
+};
+
+}  // namespace aaf

@@ -1,0 +1,210 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/objects/Header.h"
+
+#include "aaf_library/model/Enumerator.h"
+#include "aaf_library/model/Model.h"
+#include "aaf_library/objects/ContentStorage.h"
+#include "aaf_library/objects/Fresh.h"
+#include "aaf_library/objects/Identification.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFEssenceData.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+
+namespace aaf {
+
+namespace {
+
+// "II" or "MM" as a number of the machine that wrote the file.
+constexpr aafInt16 kLittleEndian = 0x4949;
+
+constexpr aafUInt32 kObjectModelVersion = 1;
+constexpr aafVersionType_t kFileVersion{1, 1};
+
+}  // namespace
+
+aafProductVersion_t LibraryVersion() {
+    return aafProductVersion_t{1, 1, 6, 0, kAAFVersionBeta};
+}
+
+void Header::SetDefaults() {
+    Object::SetDefaults();
+    PutInteger(prop::Header_ByteOrder, kLittleEndian);
+    PutStruct(prop::Header_LastModified, CurrentTime());
+    PutStruct(prop::Header_Version, kFileVersion);
+    PutInteger(prop::Header_ObjectModelVersion, kObjectModelVersion);
+    const RefPtr<ContentStorage> storage =
+        model()->NewObject<ContentStorage>(AUID_AAFContentStorage);
+    PutObject(prop::Header_Content, storage->Identity());
+    RequireValue(prop::Header_IdentificationList);
+}
+
+ContentStorage* Header::content() const {
+    return dynamic_cast<ContentStorage*>(ObjectAt(prop::Header_Content));
+}
+
+HRESULT Header::AddIdentification(const aafProductIdentification_t& product) {
+    const RefPtr<Identification> identification =
+        model()->NewObject<Identification>(AUID_AAFIdentification);
+    const HRESULT result = identification->SetProduct(product);
+    return result < 0 ? result
+                      : AppendObject(prop::Header_IdentificationList, identification->Identity());
+}
+
+void Header::Touch() {
+    PutStruct(prop::Header_LastModified, CurrentTime());
+}
+
+template <class Operation>
+HRESULT Header::OnContent(Operation operation) const {
+    ContentStorage* const storage = content();
+    return storage == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : operation(*storage);
+}
+
+HRESULT Header::LookupMob(aafMobID_constref mobID, IAAFMob** mob) {
+    return OnContent([&](ContentStorage& storage) { return storage.LookupMob(mobID, mob); });
+}
+
+HRESULT Header::CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) {
+    return OnContent([&](ContentStorage& storage) { return storage.CountMobs(mobKind, result); });
+}
+
+HRESULT Header::GetMobs(aafSearchCrit_t* searchCriteria, IEnumAAFMobs** enumerator) {
+    return OnContent(
+        [&](ContentStorage& storage) { return storage.GetMobs(searchCriteria, enumerator); });
+}
+
+HRESULT Header::AddMob(IAAFMob* mob) {
+    return OnContent([&](ContentStorage& storage) { return storage.AddMob(mob); });
+}
+
+HRESULT Header::RemoveMob(IAAFMob* mob) {
+    return OnContent([&](ContentStorage& storage) { return storage.RemoveMob(mob); });
+}
+
+HRESULT Header::CountEssenceData(aafUInt32* result) {
+    return OnContent([&](ContentStorage& storage) { return storage.CountEssenceData(result); });
+}
+
+HRESULT Header::IsEssenceDataPresent(aafMobID_constref fileMobID, aafFileFormat_t fmt,
+                                     aafBoolean_t* result) {
+    return OnContent([&](ContentStorage& storage) {
+        return storage.IsEssenceDataPresent(fileMobID, fmt, result);
+    });
+}
+
+HRESULT Header::EnumEssenceData(IEnumAAFEssenceData** enumerator) {
+    return OnContent([&](ContentStorage& storage) { return storage.EnumEssenceData(enumerator); });
+}
+
+HRESULT Header::AddEssenceData(IAAFEssenceData* essenceData) {
+    return OnContent([&](ContentStorage& storage) { return storage.AddEssenceData(essenceData); });
+}
+
+HRESULT Header::RemoveEssenceData(IAAFEssenceData* essenceData) {
+    return OnContent(
+        [&](ContentStorage& storage) { return storage.RemoveEssenceData(essenceData); });
+}
+
+HRESULT Header::LookupEssenceData(aafMobID_constref mobID, IAAFEssenceData** essenceData) {
+    return OnContent(
+        [&](ContentStorage& storage) { return storage.LookupEssenceData(mobID, essenceData); });
+}
+
+HRESULT Header::GetLastIdentification(IAAFIdentification** identification) {
+    if (identification == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const aafUInt32 count = CountObjects(prop::Header_IdentificationList);
+    return count == 0 ? AAFRESULT_OBJECT_NOT_FOUND : GetIdentificationAt(count - 1, identification);
+}
+
+HRESULT Header::LookupIdentification(aafUID_constref generation,
+                                     IAAFIdentification** identification) {
+    if (identification == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const aafUInt32 count = CountObjects(prop::Header_IdentificationList);
+    for (aafUInt32 at = 0; at < count; ++at) {
+        Object* const candidate = ObjectAt(prop::Header_IdentificationList, at);
+        aafUID_t id{};
+        if (candidate->ReadStruct(prop::Identification_GenerationAUID, &id) >= 0 &&
+            id == generation) {
+            return GiveOut(candidate, identification);
+        }
+    }
+    return AAFRESULT_OBJECT_NOT_FOUND;
+}
+
+HRESULT Header::CountIdentifications(aafUInt32* result) {
+    return ReadCount(prop::Header_IdentificationList, result);
+}
+
+HRESULT Header::GetIdentifications(IEnumAAFIdentifications** enumerator) {
+    return MakeEnumerator<IAAFIdentification>(this, prop::Header_IdentificationList, enumerator);
+}
+
+HRESULT Header::AppendIdentification(IAAFIdentification* ident) {
+    return AppendObject(prop::Header_IdentificationList, ident);
+}
+
+HRESULT Header::GetIdentificationAt(aafUInt32 index, IAAFIdentification** identification) {
+    return ReadObjectAt(prop::Header_IdentificationList, index, identification);
+}
+
+HRESULT Header::GetDictionary(IAAFDictionary** dictionary) {
+    return Object::GetDictionary(dictionary);
+}
+
+HRESULT Header::GetRefImplVersion(aafProductVersion_t* version) {
+    if (version == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    *version = LibraryVersion();
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT Header::GetFileRevision(aafVersionType_t* revision) {
+    return ReadStruct(prop::Header_Version, revision);
+}
+
+HRESULT Header::GetLastModified(aafTimeStamp_t* timeStamp) {
+    return ReadStruct(prop::Header_LastModified, timeStamp);
+}
+
+HRESULT Header::GetContentStorage(IAAFContentStorage** storage) {
+    return ReadObject(prop::Header_Content, storage);
+}
+
+HRESULT Header::GetStoredByteOrder(eAAFByteOrder_t* order) {
+    aafInt16 stored = 0;
+    if (order == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = ReadInteger(prop::Header_ByteOrder, &stored);
+    if (result >= 0) {
+        *order = stored == kLittleEndian ? kAAFByteOrderLittle : kAAFByteOrderBig;
+    }
+    return result;
+}
+
+HRESULT Header::GetNativeByteOrder(eAAFByteOrder_t* order) {
+    if (order == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const aafUInt16 probe = 1;
+    const bool little = *reinterpret_cast<const aafUInt8*>(&probe) == 1;
+    *order = little ? kAAFByteOrderLittle : kAAFByteOrderBig;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT Header::GetOperationalPattern(aafUID_t* operationalPatternID) {
+    return ReadStruct(prop::Header_OperationalPattern, operationalPatternID);
+}
+
+HRESULT Header::SetOperationalPattern(aafUID_constref operationalPatternID) {
+    return PutStruct(prop::Header_OperationalPattern, operationalPatternID);
+}
+
+}  // namespace aaf

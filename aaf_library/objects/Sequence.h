@@ -1,0 +1,31 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/objects/Component.h"
+#include "not_implemented/AAFComponents.h"
+
+namespace aaf {
+
+// Components one after the other. Its length grows with each component that is
+// added and is then a value of its own: a later change of a component does not
+// reach it.
+class Sequence : public Implements<Segment, IAAFSequence> {
+public:
+    HRESULT Initialize(IAAFDataDef* dataDef) override;
+    HRESULT AppendComponent(IAAFComponent* component) override;
+    HRESULT PrependComponent(IAAFComponent* component) override;
+    HRESULT InsertComponentAt(aafUInt32 index, IAAFComponent* component) override;
+    HRESULT GetComponentAt(aafUInt32 index, IAAFComponent** component) override;
+    HRESULT RemoveComponentAt(aafUInt32 index) override;
+    HRESULT CountComponents(aafUInt32* result) override;
+    HRESULT GetComponents(IEnumAAFComponents** enumerator) override;
+
+private:
+    // Whether a component of this data definition may stand in the sequence.
+    HRESULT CheckDataDefinition(Component& component);
+    HRESULT CheckNeighbours(const Component& component, aafUInt32 index) const;
+    Component* ComponentAt(aafUInt32 index) const;
+};
+
+}  // namespace aaf

@@ -1,0 +1,53 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/stored/StoredTree.h"
+
+// The layout of a compound file's header, shared by writer and reader:
+//
+//   offset  0  8 bytes   magic number
+//           8  16        class id, in an AAF file the signature of its kind
+//          24  u16       minor version, u16 major version
+//          28  u16       byte order mark
+//          30  u16       sector size, u16 small sector size, as powers of two
+//          40  u32       number of directory sectors (version 4 only)
+//          44  u32       number of allocation table sectors
+//          48  u32       first directory sector
+//          56  u32       size from which on a stream has sectors of its own
+//          60  u32       first sector and u32 number of the small table
+//          68  u32       first sector and u32 number of the list of tables
+//          76  109 u32   the first allocation table sectors
+//
+// Sector n begins at (n + 1) sectors from the start of the file.
+
+namespace aaf::stored {
+
+inline constexpr std::uint8_t compoundMagic[8] = {0xD0, 0xCF, 0x11, 0xE0, 0xA1, 0xB1, 0x1A, 0xE1};
+
+inline constexpr std::size_t headerSize = 512;
+inline constexpr std::size_t signatureOffset = 8;
+inline constexpr std::size_t sectorShiftOffset = 30;
+inline constexpr std::size_t tableCountOffset = 44;
+inline constexpr std::size_t firstDirectoryOffset = 48;
+inline constexpr std::size_t smallLimitOffset = 56;
+inline constexpr std::size_t firstSmallTableOffset = 60;
+inline constexpr std::size_t firstTableListOffset = 68;
+inline constexpr std::size_t tableListOffset = 76;
+inline constexpr std::uint32_t headerTableCount = 109;
+
+inline constexpr std::size_t directoryEntrySize = 128;
+inline constexpr std::uint32_t smallSectorSize = 64;
+inline constexpr std::uint32_t smallStreamLimit = 4096;
+
+inline constexpr std::uint32_t freeSector = 0xFFFFFFFF;
+inline constexpr std::uint32_t endOfChain = 0xFFFFFFFE;
+inline constexpr std::uint32_t lastPlainSector = 0xFFFFFFFA;
+
+// The two kinds of AAF file differ in the size of their sectors.
+inline constexpr StoredAuid signature512 = {0x41, 0x41, 0x46, 0x42, 0x0D, 0x00, 0x4F, 0x4D,
+                                            0x06, 0x0E, 0x2B, 0x34, 0x01, 0x01, 0x01, 0xFF};
+inline constexpr StoredAuid signature4096 = {0x01, 0x02, 0x01, 0x0D, 0x00, 0x02, 0x00, 0x00,
+                                             0x06, 0x0E, 0x2B, 0x34, 0x03, 0x02, 0x01, 0x01};
+
+}  // namespace aaf::stored

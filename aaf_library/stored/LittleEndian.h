@@ -1,0 +1,94 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/stored/StoredError.h"
+#include "aaf_library/stored/StoredTree.h"
+
+#include <cstddef>
+#include <string>
+
+namespace aaf::stored {
+
+// Appends numbers to bytes, little-endian and without padding.
+class ByteWriter {
+public:
+    template <typename Number>
+    ByteWriter& number(Number value) {
+        for (std::size_t i = 0; i < sizeof(Number); ++i) {
+            bytes_.push_back(static_cast<std::uint8_t>(static_cast<std::uint64_t>(value) >> 8 * i));
+        }
+        return *this;
+    }
+    template <typename Range>
+    ByteWriter& append(const Range& range) {
+        bytes_.insert(bytes_.end(), range.begin(), range.end());
+        return *this;
+    }
+    // A text with its terminator.
+    ByteWriter& text(const std::u16string& text) {
+        for (char16_t unit : text) {
+            number(static_cast<std::uint16_t>(unit));
+        }
+        return number(std::uint16_t{0});
+    }
+
+    const Bytes& bytes() const { return bytes_; }
+
+private:
+    Bytes bytes_;
+};
+
+// Takes numbers from a range of bytes that somebody else owns. Anything that
+// would reach beyond the end is refused.
+class ByteReader {
+public:
+    ByteReader(const std::uint8_t* begin, std::size_t size) : at_(begin), left_(size) {}
+    explicit ByteReader(const Bytes& bytes) : ByteReader(bytes.data(), bytes.size()) {}
+
+    template <typename Number>
+    Number number() {
+        const std::uint8_t* from = take(sizeof(Number));
+        std::uint64_t value = 0;
+        for (std::size_t i = 0; i < sizeof(Number); ++i) {
+            value |= std::uint64_t{from[i]} << 8 * i;
+        }
+        return static_cast<Number>(value);
+    }
+    Bytes bytes(std::size_t size) {
+        const std::uint8_t* from = take(size);
+        return Bytes(from, from + size);
+    }
+    // The rest as a text, which must end with its only terminator.
+    std::u16string text() {
+        if (left_ < 2 || left_ % 2 != 0) {
+            throw StoredError("a name of " + std::to_string(left_) + " bytes");
+        }
+        std::u16string text;
+        while (left_ > 2) {
+            text += static_cast<char16_t>(number<std::uint16_t>());
+        }
+        if (number<std::uint16_t>() != 0 || text.find(u'\0') != std::u16string::npos) {
+            throw StoredError("a name that does not end with its terminator");
+        }
+        return text;
+    }
+    std::size_t left() const { return left_; }
+
+private:
+    const std::uint8_t* take(std::size_t size) {
+        if (size > left_) {
+            throw StoredError(std::to_string(size) + " bytes wanted, " + std::to_string(left_) +
+                              " left");
+        }
+        const std::uint8_t* from = at_;
+        at_ += size;
+        left_ -= size;
+        return from;
+    }
+
+    const std::uint8_t* at_;
+    std::size_t left_;
+};
+
+}  // namespace aaf::stored

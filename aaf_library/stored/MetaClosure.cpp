@@ -1,0 +1,134 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/stored/MetaClosure.h"
+
+#include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/model/Model.h"
+#include "aaf_library/model/TypeDefinition.h"
+#include "aaf_library/stored/MetaKinds.h"
+#include "aaf_library/stored/ModelNames.h"
+#include "aaf_library/stored/ModelTypes.h"
+#include "aaf_library/stored/StoredError.h"
+
+#include <algorithm>
+
+namespace aaf::stored {
+
+namespace {
+
+bool isExtended(const ClassDefinition& definition) {
+    return !definition.IsBuiltIn() ||
+           std::any_of(
+               definition.properties().begin(), definition.properties().end(),
+               [](const RefPtr<PropertyDefinition>& property) { return !property->IsBuiltIn(); });
+}
+
+MetaClass recordOf(const ClassDefinition& definition) {
+    MetaClass record;
+    record.id = definition.id();
+    record.name = utf16Of(definition.name());
+    record.parent = definition.parent() == nullptr ? record.id : definition.parent()->id();
+    record.concrete = definition.concrete();
+    for (const RefPtr<PropertyDefinition>& property : definition.properties()) {
+        MetaProperty entry;
+        entry.id = property->id();
+        entry.name = utf16Of(property->name());
+        entry.pid = property->pid();
+        entry.type = property->typeId();
+        entry.optional = property->IsOptional();
+        entry.unique = property->IsUnique();
+        record.properties.push_back(entry);
+    }
+    return record;
+}
+
+}  // namespace
+
+void MetaClosure::addClass(const GUID& id) {
+    pendingClasses_.push_back(id);
+    addPending();
+}
+
+void MetaClosure::addType(const GUID& id) {
+    pendingTypes_.push_back(id);
+    addPending();
+}
+
+void MetaClosure::addMetaClasses() {
+    for (const GUID& id : {classDefinitionClass, propertyDefinitionClass, metaDictionaryClass}) {
+        addClass(id);
+    }
+    for (const TypeKindClass& kind : allKindClasses()) {
+        addClass(typeDefinitionClass(kind.kind));
+    }
+}
+
+void MetaClosure::addExtensions() {
+    // Entering a definition may look up others, which makes the lists longer.
+    for (std::size_t i = 0; i < model_.classes().size(); ++i) {
+        const RefPtr<ClassDefinition> definition = model_.classes()[i];
+        if (isExtended(*definition)) {
+            addClass(definition->id());
+        }
+    }
+    for (std::size_t i = 0; i < model_.types().size(); ++i) {
+        const RefPtr<TypeDefinition> type = model_.types()[i];
+        if (!type->IsBuiltIn()) {
+            addType(type->id());
+        }
+    }
+}
+
+void MetaClosure::addPending() {
+    while (!pendingClasses_.empty() || !pendingTypes_.empty()) {
+        if (!pendingClasses_.empty()) {
+            const GUID id = pendingClasses_.back();
+            pendingClasses_.pop_back();
+            enterClass(id);
+        } else {
+            const GUID id = pendingTypes_.back();
+            pendingTypes_.pop_back();
+            enterType(id);
+        }
+    }
+}
+
+void MetaClosure::enterClass(const GUID& id) {
+    if (!classes_.insert(id).second) {
+        return;
+    }
+    const ClassDefinition* definition = model_.FindClass(id);
+    if (definition == nullptr) {
+        throw StoredError("a class that is needed has no definition");
+    }
+    records_.classes.push_back(recordOf(*definition));
+    const MetaClass& record = records_.classes.back();
+    pendingClasses_.push_back(record.parent);
+    for (const MetaProperty& property : record.properties) {
+        pendingTypes_.push_back(property.type);
+    }
+}
+
+void MetaClosure::enterType(const GUID& id) {
+    if (!types_.insert(id).second) {
+        return;
+    }
+    const TypeDefinition* type = model_.FindType(id);
+    if (type == nullptr) {
+        throw StoredError("a type that is needed has no definition");
+    }
+    records_.types.push_back(stored::recordOf(*type));
+    const MetaType& record = records_.types.back();
+    if (refersToClass(record.kind)) {
+        pendingClasses_.push_back(record.target);
+    } else if (kindClass(record.kind).targetPid != 0) {
+        pendingTypes_.push_back(record.target);
+    }
+    if (record.kind == TypeKind::Record) {
+        for (const MetaMember& member : record.members) {
+            pendingTypes_.push_back(member.id);
+        }
+    }
+}
+
+}  // namespace aaf::stored

@@ -1,0 +1,47 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/model/GuidHash.h"
+#include "aaf_library/stored/MetaRecords.h"
+
+#include <unordered_set>
+
+namespace aaf {
+class Model;
+}
+
+namespace aaf::stored {
+
+// Gathers the definitions that a file has to carry: what is added and all that
+// it is made of, so that no definition refers to one that is missing.
+class MetaClosure {
+public:
+    explicit MetaClosure(Model& model) : model_(model) {}
+
+    // Throw StoredError when the model has no such definition, or lacks one
+    // that it needs.
+    void addClass(const GUID& id);
+    void addType(const GUID& id);
+
+    // The classes that the definitions themselves belong to.
+    void addMetaClasses();
+    // Whatever was registered beyond the built-in model.
+    void addExtensions();
+
+    const MetaRecords& records() const { return records_; }
+
+private:
+    void addPending();
+    void enterClass(const GUID& id);
+    void enterType(const GUID& id);
+
+    Model& model_;
+    MetaRecords records_;
+    std::unordered_set<GUID, GuidHash> classes_;
+    std::unordered_set<GUID, GuidHash> types_;
+    std::vector<GUID> pendingClasses_;
+    std::vector<GUID> pendingTypes_;
+};
+
+}  // namespace aaf::stored

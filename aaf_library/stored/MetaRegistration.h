@@ -1,0 +1,47 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/model/GuidHash.h"
+#include "aaf_library/model/RefPtr.h"
+#include "aaf_library/stored/MetaRecords.h"
+
+#include <unordered_map>
+#include <unordered_set>
+
+namespace aaf {
+class ClassDefinition;
+class Model;
+class PropertyDefinition;
+class TypeDefinition;
+}  // namespace aaf
+
+namespace aaf::stored {
+
+// Registers with a model what a file's meta-dictionary defines beyond it, and
+// tells afterwards which property a number of that file means. The records
+// must outlive it.
+class MetaRegistration {
+public:
+    // Throws StoredError.
+    MetaRegistration(const MetaRecords& records, Model& model);
+
+    // The model's definition of what the file calls `pid` in objects of that
+    // class; null when neither file nor model defines it.
+    PropertyDefinition* property(ClassDefinition& definition, std::uint16_t pid) const;
+
+private:
+    ClassDefinition* enterClass(const GUID& id, int depth);
+    TypeDefinition* enterType(const GUID& id, int depth);
+    TypeDefinition* makeType(const MetaType& record, int depth);
+    void enterProperties();
+
+    Model& model_;
+    std::unordered_map<GUID, const MetaClass*, GuidHash> classes_;
+    std::unordered_map<GUID, const MetaType*, GuidHash> types_;
+    std::unordered_set<GUID, GuidHash> begun_;
+    // For each class of the file its own numbers.
+    std::unordered_map<GUID, std::unordered_map<std::uint16_t, GUID>, GuidHash> pids_;
+};
+
+}  // namespace aaf::stored

@@ -1,0 +1,41 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/stored/ModelFile.h"
+
+#include "aaf_library/model/Model.h"
+#include "aaf_library/stored/ModelReader.h"
+#include "aaf_library/stored/ModelWriter.h"
+#include "aaf_library/stored/StoredError.h"
+
+#include <new>
+
+namespace aaf::stored {
+
+FileResult saveModel(Model& model, Object& header, const std::filesystem::path& path,
+                     SectorSize sectorSize) {
+    try {
+        return saveTree(treeOfModel(model, header), path, sectorSize);
+    } catch (const StoredError& problem) {
+        return {FileFailure::NotStorable, path.u8string() + ": " + problem.what()};
+    } catch (const std::bad_alloc&) {
+        return {FileFailure::NoMemory, path.u8string() + ": not enough memory to write it"};
+    }
+}
+
+FileResult loadModel(const std::filesystem::path& path, Model& model, RefPtr<Object>& header) {
+    header = nullptr;
+    StoredObject root;
+    if (FileResult result = loadTree(path, root); !result) {
+        return result;
+    }
+    try {
+        header = readModel(root, model);
+        return {};
+    } catch (const StoredError& problem) {
+        return {FileFailure::Damaged, path.u8string() + ": " + problem.what()};
+    } catch (const std::bad_alloc&) {
+        return {FileFailure::NoMemory, path.u8string() + ": not enough memory to read it"};
+    }
+}
+
+}  // namespace aaf::stored

@@ -1,0 +1,59 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/stored/ModelNames.h"
+
+#include "aaf_library/model/Text.h"
+#include "aaf_library/model/TypeDefinition.h"
+#include "aaf_library/stored/LittleEndian.h"
+
+namespace aaf::stored {
+
+std::u16string utf16Of(const std::wstring& text) {
+    Bytes stored;
+    AppendUtf16(text.data(), text.size(), stored);
+    ByteReader from(stored);
+    std::u16string out;
+    while (from.left() != 0) {
+        out += static_cast<char16_t>(from.number<std::uint16_t>());
+    }
+    return out;
+}
+
+std::wstring wideOf(const std::u16string& text) {
+    ByteWriter stored;
+    for (char16_t unit : text) {
+        stored.number(static_cast<std::uint16_t>(unit));
+    }
+    return FromUtf16(stored.bytes().data(), stored.bytes().size());
+}
+
+StoredForm storedFormOf(const TypeDefinition& type) {
+    switch (type.form()) {
+        case ValueForm::Stream:
+            return StoredForm::Stream;
+        case ValueForm::StrongReference:
+            return StoredForm::StrongReference;
+        case ValueForm::StrongVector:
+            return StoredForm::StrongVector;
+        case ValueForm::StrongSet:
+            return StoredForm::StrongSet;
+        case ValueForm::WeakReference:
+            return StoredForm::WeakReference;
+        case ValueForm::WeakVector:
+            return StoredForm::WeakVector;
+        case ValueForm::WeakSet:
+            return StoredForm::WeakSet;
+        case ValueForm::Data:
+            break;
+    }
+    return StoredForm::Data;
+}
+
+const TypeDefinition& referenceIn(const TypeDefinition& type) {
+    const TypeDefinition& plain = type.Resolved();
+    const bool isCollection =
+        plain.kind() == TypeKind::VariableArray || plain.kind() == TypeKind::Set;
+    return isCollection && plain.element() != nullptr ? plain.element()->Resolved() : plain;
+}
+
+}  // namespace aaf::stored

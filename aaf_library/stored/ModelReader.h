@@ -1,0 +1,23 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/model/RefPtr.h"
+#include "aaf_library/stored/StoredTree.h"
+
+namespace aaf {
+class Model;
+class Object;
+}  // namespace aaf
+
+namespace aaf::stored {
+
+// Brings the tree of a file into a model, which should be new: definitions
+// that the model lacks are registered, those of the file's dictionary join the
+// model's, and the header comes back with everything in it; its dictionary is
+// the model's. Properties are told by their ids, so the file's own
+// numbers do not matter. Values that nothing describes are passed over.
+// Throws StoredError; the model then is of no further use.
+RefPtr<Object> readModel(const StoredObject& root, Model& model);
+
+}  // namespace aaf::stored

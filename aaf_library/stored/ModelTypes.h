@@ -1,0 +1,26 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/model/RefPtr.h"
+#include "aaf_library/stored/MetaRecords.h"
+
+namespace aaf {
+class Model;
+class TypeDefinition;
+}  // namespace aaf
+
+namespace aaf::stored {
+
+// Pids from here on mean something else in every file.
+inline constexpr std::uint16_t firstLocalPid = 0x8000;
+
+// The type with all that its definition says.
+MetaType recordOf(const TypeDefinition& type);
+
+// A free type made of the record. Everything that it refers to must be in the
+// model. Null when the record makes no sense, such as an integer of 3 bytes or
+// a value that is larger than any that can be stored.
+RefPtr<TypeDefinition> typeOf(const MetaType& record, Model& model);
+
+}  // namespace aaf::stored

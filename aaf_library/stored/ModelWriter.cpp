@@ -1,0 +1,336 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/stored/ModelWriter.h"
+
+#include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/model/Dictionary.h"
+#include "aaf_library/model/Model.h"
+#include "aaf_library/model/TypeDefinition.h"
+#include "aaf_library/stored/MetaClosure.h"
+#include "aaf_library/stored/MetaPids.h"
+#include "aaf_library/stored/ModelNames.h"
+#include "aaf_library/stored/ModelTypes.h"
+#include "aaf_library/stored/StoredError.h"
+#include "aaf_library/stored/StoredFile.h"
+#include "aaf_library/stored/StoredNames.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
+
+#include <algorithm>
+#include <map>
+#include <set>
+
+namespace aaf::stored {
+
+namespace {
+
+using Path = std::vector<std::uint16_t>;
+
+constexpr std::size_t idSize = sizeof(StoredAuid);
+
+bool isBuiltInDefinition(const Bytes& id) {
+    const GUID wanted = guidOf(id);
+    for (Span<BuiltInDefinition> table :
+         {BuiltInDataDefinitions(), BuiltInContainerDefinitions()}) {
+        for (const BuiltInDefinition& definition : table) {
+            if (definition.id == wanted) {
+                return true;
+            }
+        }
+    }
+    return false;
+}
+
+void sortByPid(StoredObject& object) {
+    std::sort(object.properties.begin(), object.properties.end(),
+              [](const StoredProperty& a, const StoredProperty& b) { return a.pid < b.pid; });
+}
+
+class ModelWriter {
+public:
+    explicit ModelWriter(Model& model) : model_(model), closure_(model) {}
+
+    StoredObject write(Object& header) {
+        StoredObject storedHeader = object(header, prop::Header_Dictionary.pid);
+        storedHeader.properties.push_back(
+            reference(prop::Header_Dictionary.pid, u"Dictionary", dictionary(model_.dictionary())));
+        sortByPid(storedHeader);
+
+        closure_.addMetaClasses();
+        closure_.addExtensions();
+        StoredObject root;
+        root.classId = rootClassId;
+        root.properties.push_back(reference(meta::rootMetaDictionary, u"MetaDictionary",
+                                            storedMetaDictionary(closure_.records())));
+        root.properties.push_back(reference(meta::rootHeader, u"Header", std::move(storedHeader)));
+        return root;
+    }
+
+private:
+    static StoredProperty reference(std::uint16_t pid, const std::u16string& name,
+                                    StoredObject object) {
+        StoredProperty property;
+        property.pid = pid;
+        property.form = StoredForm::StrongReference;
+        property.name = name;
+        property.objects.push_back(std::move(object));
+        return property;
+    }
+
+    // All properties of the object but the one that is left out.
+    StoredObject object(const Object& from, PropertyId leftOut = kNoPropertyId) {
+        StoredObject out;
+        out.classId = storedAuid(from.classId());
+        closure_.addClass(from.classId());
+        for (const auto& entry : from.values()) {
+            if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
+                out.properties.push_back(property(from, entry.first, *entry.second));
+            }
+        }
+        addRequired(from, out, leftOut);
+        sortByPid(out);
+        return out;
+    }
+
+    StoredProperty property(const Object& from, PropertyId pid, const PropertyValue& value) {
+        const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
+        if (definition == nullptr || definition->type() == nullptr) {
+            throw StoredError(propertyText(pid) + " has no definition");
+        }
+        StoredProperty out = emptyProperty(*definition);
+        if (storedFormOf(value.type()) != out.form) {
+            throw StoredError(text(*definition) + " holds a value of another form than its type");
+        }
+        try {
+            fill(out, *definition, value);
+        } catch (const StoredError& problem) {
+            throw StoredError(text(*definition) + ": " + problem.what());
+        }
+        return out;
+    }
+
+    void fill(StoredProperty& out, const PropertyDefinition& definition,
+              const PropertyValue& value) {
+        switch (out.form) {
+            case StoredForm::Data:
+                noteCarriedType(value);
+                out.bytes = value.bytes();
+                break;
+            case StoredForm::Stream:
+                out.bytes = value.bytes();
+                break;
+            case StoredForm::StrongReference:
+            case StoredForm::StrongVector:
+            case StoredForm::StrongSet:
+                for (const RefPtr<Object>& contained : value.objects()) {
+                    out.objects.push_back(object(*contained));
+                    if (out.form == StoredForm::StrongSet) {
+                        out.keys.push_back(contained->UniqueKey());
+                    }
+                }
+                break;
+            case StoredForm::WeakReference:
+            case StoredForm::WeakVector:
+            case StoredForm::WeakSet:
+                addTargets(out, *definition.type(), value.bytes());
+                break;
+        }
+    }
+
+    // A property of the right form and name that holds nothing yet.
+    StoredProperty emptyProperty(const PropertyDefinition& definition) {
+        StoredProperty out;
+        out.pid = definition.pid();
+        out.name = utf16Of(definition.name());
+        out.form = storedFormOf(*definition.type());
+        if (out.form == StoredForm::StrongSet) {
+            const MetaType target = recordOf(referenceIn(*definition.type()));
+            const PropertyDefinition* key = keyOf(target.target);
+            out.keyPid = key->pid();
+            out.keySize = static_cast<std::uint8_t>(key->type()->StoredSize());
+        }
+        return out;
+    }
+
+    const PropertyDefinition* keyOf(const GUID& classId) {
+        const ClassDefinition* definition = model_.FindClass(classId);
+        const PropertyDefinition* key =
+            definition == nullptr ? nullptr : definition->FindUniqueProperty();
+        if (key == nullptr || key->type() == nullptr) {
+            throw StoredError("a set of objects that have no key");
+        }
+        return key;
+    }
+
+    void addTargets(StoredProperty& out, const TypeDefinition& type, const Bytes& ids) {
+        const MetaType reference = recordOf(referenceIn(type));
+        for (const MetaMember& step : reference.members) {
+            out.targetPath.push_back(pidOf(step.id));
+        }
+        out.keyPid = keyOf(reference.target)->pid();
+        for (std::size_t at = 0; at + idSize <= ids.size(); at += idSize) {
+            const auto from = ids.begin() + static_cast<std::ptrdiff_t>(at);
+            out.keys.emplace_back(from, from + idSize);
+            if (targets_[out.targetPath].insert(out.keys.back()).second) {
+                noteMetaTarget(out.targetPath, guidOf(out.keys.back()));
+            }
+        }
+    }
+
+    PropertyId pidOf(const GUID& property) {
+        if (property == rootMetaDictionaryId) {
+            return meta::rootMetaDictionary;
+        }
+        if (property == rootHeaderId) {
+            return meta::rootHeader;
+        }
+        if (const PropertyDefinition* known = model_.FindProperty(property)) {
+            return known->pid();
+        }
+        const BuiltInProperty* builtIn = FindBuiltInProperty(property);
+        return builtIn == nullptr ? kNoPropertyId : builtIn->pid;
+    }
+
+    // References may also lead into the meta-dictionary.
+    void noteMetaTarget(const Path& path, const GUID& id) {
+        if (path == Path{meta::rootMetaDictionary, meta::classDefinitions}) {
+            closure_.addClass(id);
+        } else if (path == Path{meta::rootMetaDictionary, meta::typeDefinitions}) {
+            closure_.addType(id);
+        }
+    }
+
+    // The type that an indirect value names has to be in the file.
+    void noteCarriedType(const PropertyValue& value) {
+        const TypeKind kind = value.type().Resolved().kind();
+        const Bytes& bytes = value.bytes();
+        if ((kind == TypeKind::Indirect || kind == TypeKind::Opaque) && bytes.size() > idSize) {
+            const GUID id = guidOf(Bytes(bytes.begin() + 1, bytes.begin() + 1 + idSize));
+            if (model_.FindType(id) != nullptr) {
+                closure_.addType(id);
+            }
+        }
+    }
+
+    // Readers want the collections that a class requires, and an (empty) set
+    // of essence data; an object that is required and absent stops them.
+    void addRequired(const Object& from, StoredObject& out, PropertyId leftOut) {
+        for (const PropertyDefinition* definition : requiredObjects(from.classDefinition())) {
+            if (definition->pid() == leftOut || out.find(definition->pid()) != nullptr) {
+                continue;
+            }
+            StoredProperty empty = emptyProperty(*definition);
+            if (empty.form == StoredForm::StrongReference) {
+                throw StoredError(toUtf8(utf16Of(from.classDefinition().name())) + " has no " +
+                                  toUtf8(utf16Of(definition->name())));
+            }
+            out.properties.push_back(std::move(empty));
+        }
+    }
+
+    const std::vector<const PropertyDefinition*>& requiredObjects(
+        const ClassDefinition& definition) {
+        const auto known = required_.find(&definition);
+        if (known != required_.end()) {
+            return known->second;
+        }
+        std::vector<const PropertyDefinition*>& out = required_[&definition];
+        for (const ClassDefinition* at = &definition; at != nullptr; at = at->parent()) {
+            for (const RefPtr<PropertyDefinition>& property : at->properties()) {
+                const bool wanted = !property->IsOptional() ||
+                                    property->id() == prop::ContentStorage_EssenceData.id;
+                if (!wanted || property->type() == nullptr) {
+                    continue;
+                }
+                const StoredForm form = storedFormOf(*property->type());
+                if (form == StoredForm::StrongReference || form == StoredForm::StrongVector ||
+                    form == StoredForm::StrongSet) {
+                    out.push_back(property.get());
+                }
+            }
+        }
+        return out;
+    }
+
+    // Of the definitions that every model has from the start only those are
+    // stored that something refers to. A definition may refer to others, so
+    // the sets are gone through until nothing is added.
+    StoredObject dictionary(const Object& from) {
+        StoredObject out;
+        out.classId = storedAuid(from.classId());
+        closure_.addClass(from.classId());
+        std::map<PropertyId, StoredProperty> sets;
+        for (const auto& entry : from.values()) {
+            if (storedFormOf(entry.second->type()) == StoredForm::StrongSet) {
+                sets[entry.first] =
+                    emptyProperty(*from.classDefinition().FindProperty(entry.first));
+            } else {
+                out.properties.push_back(property(from, entry.first, *entry.second));
+            }
+        }
+        std::set<const Object*> stored;
+        std::size_t before = 0;
+        do {
+            before = stored.size();
+            for (auto& set : sets) {
+                addDefinitions(set.second, from.values().at(set.first)->objects(), stored);
+            }
+        } while (stored.size() != before);
+        for (auto& set : sets) {
+            if (!set.second.objects.empty()) {
+                out.properties.push_back(std::move(set.second));
+            }
+        }
+        checkTargets(out);
+        sortByPid(out);
+        return out;
+    }
+
+    void addDefinitions(StoredProperty& set, const std::vector<RefPtr<Object>>& definitions,
+                        std::set<const Object*>& stored) {
+        const Path path = {meta::rootHeader, prop::Header_Dictionary.pid, set.pid};
+        for (const RefPtr<Object>& definition : definitions) {
+            const Bytes key = definition->UniqueKey();
+            const bool wanted = !isBuiltInDefinition(key) || targets_[path].count(key) != 0;
+            if (wanted && stored.insert(definition.get()).second) {
+                set.keys.push_back(key);
+                set.objects.push_back(object(*definition));
+            }
+        }
+    }
+
+    // Readers fail when a target is not where the reference says it is.
+    void checkTargets(const StoredObject& dictionary) {
+        for (const auto& entry : targets_) {
+            const Path& path = entry.first;
+            if (path.size() != 3 || path[1] != prop::Header_Dictionary.pid) {
+                continue;
+            }
+            const StoredProperty* set = dictionary.find(path[2]);
+            for (const Bytes& key : entry.second) {
+                if (set == nullptr ||
+                    std::find(set->keys.begin(), set->keys.end(), key) == set->keys.end()) {
+                    throw StoredError(
+                        "a definition that is referred to is not in the dictionary (" +
+                        propertyText(path[2]) + ")");
+                }
+            }
+        }
+    }
+
+    static std::string text(const PropertyDefinition& definition) {
+        return toUtf8(utf16Of(definition.name()));
+    }
+
+    Model& model_;
+    MetaClosure closure_;
+    std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
+    std::map<const ClassDefinition*, std::vector<const PropertyDefinition*>> required_;
+};
+
+}  // namespace
+
+StoredObject treeOfModel(Model& model, Object& header) {
+    return ModelWriter(model).write(header);
+}
+
+}  // namespace aaf::stored

@@ -1,0 +1,22 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/stored/StoredTree.h"
+
+namespace aaf {
+class Model;
+class Object;
+}  // namespace aaf
+
+namespace aaf::stored {
+
+// The tree of a whole file: the header with everything in it, the definitions
+// of the dictionary that are referred to or that a caller added, and the
+// meta-dictionary with all classes, properties and types that these need, plus
+// every extension that is registered. Required collections that are absent are
+// stored empty. Throws StoredError when an object lacks one that it must hold,
+// such as a slot its segment.
+StoredObject treeOfModel(Model& model, Object& header);
+
+}  // namespace aaf::stored

@@ -1,0 +1,169 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/stored/StoredFile.h"
+
+#include "aaf_library/stored/CompoundFileFormat.h"
+#include "aaf_library/stored/StoredError.h"
+#include "aaf_library/stored/TreeReader.h"
+#include "aaf_library/stored/TreeWriter.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstring>
+#include <fstream>
+#include <new>
+#include <system_error>
+
+namespace aaf::stored {
+
+const StoredAuid rootClassId = {0xA5, 0x98, 0xB3, 0xB3, 0x90, 0x1C, 0xD4, 0x11,
+                                0x80, 0x53, 0x08, 0x00, 0x36, 0x21, 0x08, 0x04};
+
+namespace {
+
+FileResult failed(FileFailure failure, const std::filesystem::path& path, const std::string& what) {
+    return {failure, path.u8string() + ": " + what};
+}
+
+// What the last failed call of the C library left as its reason.
+FileResult systemFailure(const std::filesystem::path& path, const std::string& what) {
+    const int reason = errno;
+    const FileFailure failure = reason == ENOENT ? FileFailure::NotThere : FileFailure::NoAccess;
+    std::string text = what;
+    if (reason != 0) {
+        text += ": " + std::generic_category().message(reason);
+    }
+    return failed(failure, path, text);
+}
+
+// Removes the half-written file unless it was put in place.
+class TemporaryFile {
+public:
+    explicit TemporaryFile(const std::filesystem::path& target) : path_(target) {
+        path_ += ".part";
+        std::error_code ignored;
+        for (int i = 2; std::filesystem::exists(path_, ignored); ++i) {
+            path_ = target;
+            path_ += ".part" + std::to_string(i);
+        }
+    }
+    TemporaryFile(const TemporaryFile&) = delete;
+    TemporaryFile& operator=(const TemporaryFile&) = delete;
+    ~TemporaryFile() {
+        if (exists_) {
+            std::error_code ignored;
+            std::filesystem::remove(path_, ignored);
+        }
+    }
+
+    bool write(const Bytes& bytes) {
+        errno = 0;
+        std::ofstream out(path_, std::ios::binary | std::ios::trunc);
+        exists_ = out.is_open();
+        out.write(reinterpret_cast<const char*>(bytes.data()),
+                  static_cast<std::streamsize>(bytes.size()));
+        out.close();
+        return exists_ && !out.fail();
+    }
+
+    std::error_code moveTo(const std::filesystem::path& target) {
+        std::error_code problem;
+        std::filesystem::rename(path_, target, problem);
+        exists_ = static_cast<bool>(problem);
+        return problem;
+    }
+
+private:
+    std::filesystem::path path_;
+    bool exists_ = false;
+};
+
+FileResult replaceFile(const Bytes& bytes, const std::filesystem::path& path) {
+    TemporaryFile temporary(path);
+    if (!temporary.write(bytes)) {
+        return systemFailure(path, "cannot be written");
+    }
+    if (const std::error_code problem = temporary.moveTo(path)) {
+        return failed(FileFailure::NoAccess, path, "cannot be replaced: " + problem.message());
+    }
+    return {};
+}
+
+FileResult readFile(const std::filesystem::path& path, Bytes& bytes) {
+    std::error_code problem;
+    if (std::filesystem::is_directory(path, problem)) {
+        return failed(FileFailure::NoAccess, path, "is a folder");
+    }
+    errno = 0;
+    std::ifstream in(path, std::ios::binary);
+    if (!in) {
+        return systemFailure(path, "cannot be opened");
+    }
+    constexpr std::size_t chunk = 1 << 20;
+    while (in) {
+        const std::size_t had = bytes.size();
+        bytes.resize(had + chunk);
+        in.read(reinterpret_cast<char*>(bytes.data() + had), chunk);
+        bytes.resize(had + static_cast<std::size_t>(in.gcount()));
+    }
+    if (in.bad()) {
+        return systemFailure(path, "cannot be read");
+    }
+    return {};
+}
+
+bool carriesSignature(const std::uint8_t* header, std::size_t size, SectorSize* kind) {
+    if (size < signatureOffset + sizeof(StoredAuid) ||
+        std::memcmp(header, compoundMagic, sizeof(compoundMagic)) != 0) {
+        return false;
+    }
+    StoredAuid signature;
+    std::memcpy(signature.data(), header + signatureOffset, signature.size());
+    if (signature != signature512 && signature != signature4096) {
+        return false;
+    }
+    if (kind != nullptr) {
+        *kind = signature == signature512 ? SectorSize::Bytes512 : SectorSize::Bytes4096;
+    }
+    return true;
+}
+
+}  // namespace
+
+FileResult saveTree(const StoredObject& root, const std::filesystem::path& path,
+                    SectorSize sectorSize) {
+    try {
+        return replaceFile(writeTree(root, sectorSize), path);
+    } catch (const StoredError& problem) {
+        return failed(FileFailure::NotStorable, path, problem.what());
+    } catch (const std::bad_alloc&) {
+        return failed(FileFailure::NoMemory, path, "not enough memory to write it");
+    }
+}
+
+FileResult loadTree(const std::filesystem::path& path, StoredObject& root) {
+    try {
+        Bytes bytes;
+        if (FileResult result = readFile(path, bytes); !result) {
+            return result;
+        }
+        if (!carriesSignature(bytes.data(), bytes.size(), nullptr)) {
+            return failed(FileFailure::NotAaf, path, "is no AAF file");
+        }
+        root = readTree(bytes);
+        return {};
+    } catch (const StoredError& problem) {
+        return failed(FileFailure::Damaged, path, problem.what());
+    } catch (const std::bad_alloc&) {
+        return failed(FileFailure::NoMemory, path, "not enough memory to read it");
+    }
+}
+
+bool isAafFile(const std::filesystem::path& path, SectorSize* kind) {
+    std::uint8_t header[signatureOffset + sizeof(StoredAuid)] = {};
+    std::ifstream in(path, std::ios::binary);
+    in.read(reinterpret_cast<char*>(header), sizeof(header));
+    return carriesSignature(header, static_cast<std::size_t>(in.gcount()), kind);
+}
+
+}  // namespace aaf::stored

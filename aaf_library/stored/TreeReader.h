@@ -1,0 +1,15 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/stored/StoredTree.h"
+
+namespace aaf::stored {
+
+// Makes the tree of a compound file's bytes. Hostile files are refused: every
+// storage and stream is taken once, every count is held against the bytes
+// that are there. Storages and streams that no property names are passed over.
+// Throws StoredError with the place and the defect.
+StoredObject readTree(const Bytes& file);
+
+}  // namespace aaf::stored
