@@ -30,7 +30,7 @@ Index<BuiltInProperty> IndexOfProperties() {
     Index<BuiltInProperty> index;
     for (const BuiltInClass& entry : BuiltInClasses()) {
         for (const BuiltInProperty& property : entry.properties) {
-            index.emplace(property.id, &property);
+            index.emplace(property.key.id, &property);
         }
     }
     return index;

@@ -18,6 +18,10 @@ struct Span {
     const T* first = nullptr;
     std::size_t count = 0;
 
+    constexpr Span() = default;
+    template <std::size_t N>
+    constexpr Span(const T (&table)[N]) : first(table), count(N) {}
+
     const T* begin() const { return first; }
     const T* end() const { return first + count; }
     std::size_t size() const { return count; }
@@ -44,8 +48,7 @@ enum class TypeKind {
 
 struct BuiltInProperty {
     const char* name;
-    GUID id;
-    PropertyId pid;  // kNoPropertyId: allotted by each file
+    PropertyKey key;
     GUID type;
     bool optional;
     bool unique;

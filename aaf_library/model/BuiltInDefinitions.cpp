@@ -122,11 +122,11 @@ constexpr BuiltInDefinition kContainerDefinitions[] = {
 }  // namespace
 
 Span<BuiltInDefinition> BuiltInDataDefinitions() {
-    return {kDataDefinitions, sizeof kDataDefinitions / sizeof kDataDefinitions[0]};
+    return kDataDefinitions;
 }
 
 Span<BuiltInDefinition> BuiltInContainerDefinitions() {
-    return {kContainerDefinitions, sizeof kContainerDefinitions / sizeof kContainerDefinitions[0]};
+    return kContainerDefinitions;
 }
 
 }  // namespace aaf

@@ -213,8 +213,8 @@ ClassDefinition* Model::AddBuiltInClass(const BuiltInClass& entry) {
     }
     for (const BuiltInProperty& property : entry.properties) {
         definition
-            ->AddProperty(property.id, Widen(property.name), property.type, property.optional,
-                          property.unique, property.pid)
+            ->AddProperty(property.key.id, Widen(property.name), property.type, property.optional,
+                          property.unique, property.key.pid)
             .MarkBuiltIn();
     }
     return &Enter(std::move(definition));

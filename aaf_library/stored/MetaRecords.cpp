@@ -43,7 +43,7 @@ const GUID propertyDefinitionClass = metaClass(0x0202);
 const GUID metaDictionaryClass = metaClass(0x0225);
 
 Span<TypeKindClass> allKindClasses() {
-    return {typeKinds, std::size(typeKinds)};
+    return typeKinds;
 }
 
 const TypeKindClass& kindClass(TypeKind kind) {

@@ -187,7 +187,7 @@ private:
             return known->pid();
         }
         const BuiltInProperty* builtIn = FindBuiltInProperty(property);
-        return builtIn == nullptr ? kNoPropertyId : builtIn->pid;
+        return builtIn == nullptr ? kNoPropertyId : builtIn->key.pid;
     }
 
     // References may also lead into the meta-dictionary.

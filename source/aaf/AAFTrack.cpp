@@ -5,6 +5,8 @@
 
 #include <cwchar>
 
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "source/aaf/AAFGuard.h"
 #include "source/plugin/ResultChecks.h"
 

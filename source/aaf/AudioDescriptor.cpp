@@ -4,6 +4,7 @@
 #include "source/aaf/AudioDescriptor.h"
 
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFSoundDescriptors.h"
 #include "source/aaf/BinColumns.h"
 #include "source/aaf/EditUnits.h"
 #include "source/aaf/UniversalLabels.h"

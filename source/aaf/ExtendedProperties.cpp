@@ -6,6 +6,7 @@
 #include <cstddef>
 
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "host_interfaces/aaf/AAFObjects.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "source/aaf/AAFDefs.h"

@@ -5,6 +5,7 @@
 
 #include "host_interfaces/aaf/AAFComponents.h"
 #include "host_interfaces/aaf/AAFLocators.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/aaf/AAFDefs.h"
 #include "source/aaf/AAFGuard.h"

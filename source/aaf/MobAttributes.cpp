@@ -4,6 +4,8 @@
 #include "source/aaf/MobAttributes.h"
 
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "source/aaf/AAFDefs.h"
 #include "source/aaf/AAFGuard.h"

@@ -10,6 +10,7 @@
 #include "source/aaf/NewAAFFromMovie.h"
 
 #include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMasterMobs.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/util/NMAUtil.h"

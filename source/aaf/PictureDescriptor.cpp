@@ -6,6 +6,7 @@
 #include "source/aaf/PictureDescriptor.h"
 
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
 #include "source/aaf/AAFDefs.h"
 #include "source/aaf/BinColumns.h"
 #include "source/aaf/ColorLabels.h"

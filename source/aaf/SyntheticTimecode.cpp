@@ -4,6 +4,8 @@
 #include <cstdio>
 #include <ctime>
 
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/aaf/EditUnits.h"
 #include "source/aaf/Timecode.h"

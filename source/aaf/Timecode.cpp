@@ -9,6 +9,7 @@
 #include "source/aaf/Timecode.h"
 
 #include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFTimecodes.h"
 #include "source/aaf/AAFDefs.h"
 #include "source/aaf/AAFGuard.h"

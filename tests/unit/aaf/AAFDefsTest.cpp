@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "source/aaf/AAFDefs.h"
 
 #include <functional>

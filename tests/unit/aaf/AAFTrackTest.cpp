@@ -4,6 +4,8 @@
 #include "source/aaf/AAFTrack.h"
 
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/MobIds.h"
 #include "tests/unit/aaf/support/AAFTest.h"
 

@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/BinColumns.h"
 
 #include "source/aaf/BinColumnMapping.h"

@@ -1,6 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "source/aaf/ExtendedProperties.h"
 
 #include "source/aaf/ColorLabels.h"

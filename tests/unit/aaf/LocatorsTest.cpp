@@ -1,6 +1,9 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/Locators.h"
 
 #include "tests/unit/aaf/support/AAFTest.h"

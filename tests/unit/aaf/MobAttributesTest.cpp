@@ -1,6 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "source/aaf/MobAttributes.h"
 
 #include <functional>

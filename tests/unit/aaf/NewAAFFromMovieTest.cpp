@@ -1,6 +1,9 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/NewAAFFromMovie.h"
 
 #include <map>

@@ -9,6 +9,7 @@
 #include <filesystem>
 #include <fstream>
 
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/Timecode.h"
 #include "source/plugin/os/Os.h"
 #include "tests/support/fakes/FakeLock.h"

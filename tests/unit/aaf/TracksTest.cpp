@@ -1,6 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/Tracks.h"
 
 #include <algorithm>

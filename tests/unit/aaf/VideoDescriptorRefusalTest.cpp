@@ -4,6 +4,9 @@
 // Every call of the library that a picture descriptor makes, refused: the
 // statement that is logged and the code that comes back.
 
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
 #include "tests/unit/aaf/support/VideoDescriptorTest.h"
 
 namespace NMA::Impl {

@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "host_interfaces/aaf/AAFDescriptors.h"
 #include "source/aaf/VideoDescriptor.h"
 
 #include "tests/unit/aaf/support/VideoDescriptorTest.h"

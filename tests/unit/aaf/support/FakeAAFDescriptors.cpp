@@ -3,6 +3,10 @@
 
 // Descriptors and locators, and names of data definitions.
 
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
+#include "host_interfaces/aaf/AAFSoundDescriptors.h"
 #include "tests/unit/aaf/support/FakeAAFObject.h"
 
 namespace {

@@ -3,6 +3,13 @@
 
 // Mobs, slots and what slots hold.
 
+#include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFTimecodes.h"
 #include "tests/unit/aaf/support/FakeAAFObject.h"
 
 namespace {

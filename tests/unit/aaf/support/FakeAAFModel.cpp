@@ -4,6 +4,12 @@
 // File, header, dictionary, definitions, types and values.
 
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "tests/unit/aaf/support/FakeAAFObject.h"
 

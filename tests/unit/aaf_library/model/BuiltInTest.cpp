@@ -4,6 +4,7 @@
 #include <set>
 
 #include "aaf_library/model/Text.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "tests/unit/aaf_library/model/ModelFixture.h"
 
 namespace {
@@ -34,9 +35,10 @@ TEST_F(BuiltInModel, NumbersOfPropertiesAreUniqueAlongEachChain) {
     std::map<aaf::PropertyId, const char*> numbers;
     for (const aaf::BuiltInClass& entry : aaf::BuiltInClasses()) {
         for (const aaf::BuiltInProperty& property : entry.properties) {
-            if (property.pid != aaf::kNoPropertyId) {
-                EXPECT_TRUE(numbers.emplace(property.pid, property.name).second) << property.name;
-                EXPECT_LT(property.pid, 0x8000);
+            if (property.key.pid != aaf::kNoPropertyId) {
+                EXPECT_TRUE(numbers.emplace(property.key.pid, property.name).second)
+                    << property.name;
+                EXPECT_LT(property.key.pid, 0x8000);
             }
         }
     }

@@ -2,6 +2,23 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
+#include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFEffectDefinitions.h"
+#include "host_interfaces/aaf/AAFEffects.h"
+#include "host_interfaces/aaf/AAFEvents.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
+#include "host_interfaces/aaf/AAFPluginDefinitions.h"
+#include "host_interfaces/aaf/AAFSoundDescriptors.h"
+#include "host_interfaces/aaf/AAFTimecodes.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "not_implemented/AAF.h"
 
 // Calls every slot of every interface as a caller does that knows nothing but its

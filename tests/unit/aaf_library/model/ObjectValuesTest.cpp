@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "tests/unit/aaf_library/model/ModelFixture.h"
 
 namespace {

@@ -1,5 +1,13 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFSoundDescriptors.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "tests/unit/aaf_library/objects/ClipDescription.h"
 
 namespace aaf_test {

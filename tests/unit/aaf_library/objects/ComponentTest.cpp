@@ -1,5 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFEffects.h"
+#include "host_interfaces/aaf/AAFTimecodes.h"
 #include "tests/unit/aaf_library/objects/TransientFile.h"
 
 namespace aaf_test {

@@ -1,5 +1,9 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
+#include "host_interfaces/aaf/AAFSoundDescriptors.h"
 #include "tests/unit/aaf_library/objects/TransientFile.h"
 
 namespace aaf_test {

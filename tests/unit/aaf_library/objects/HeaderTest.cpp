@@ -1,5 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "tests/unit/aaf_library/objects/TransientFile.h"
 
 namespace aaf_test {

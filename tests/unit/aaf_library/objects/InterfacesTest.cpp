@@ -1,5 +1,18 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFDescriptors.h"
+#include "host_interfaces/aaf/AAFEffectDefinitions.h"
+#include "host_interfaces/aaf/AAFEffects.h"
+#include "host_interfaces/aaf/AAFEvents.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFPictureDescriptors.h"
+#include "host_interfaces/aaf/AAFPluginDefinitions.h"
+#include "host_interfaces/aaf/AAFSoundDescriptors.h"
+#include "host_interfaces/aaf/AAFTimecodes.h"
 #include "tests/unit/aaf_library/objects/TransientFile.h"
 
 namespace aaf_test {

@@ -4,6 +4,13 @@
 
 #include <chrono>
 
+#include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
+#include "host_interfaces/aaf/AAFMasterMobs.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
+#include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "tests/unit/aaf_library/objects/TransientFile.h"
 
 namespace aaf_test {

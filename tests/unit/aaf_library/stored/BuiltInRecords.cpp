@@ -21,8 +21,9 @@ MetaRecords builtInRecords() {
     for (const BuiltInClass& entry : BuiltInClasses()) {
         MetaClass record{entry.id, wide(entry.name), entry.parent, entry.concrete, {}};
         for (const BuiltInProperty& property : entry.properties) {
-            const std::uint16_t pid = property.pid != kNoPropertyId ? property.pid : localPid--;
-            record.properties.push_back({property.id, wide(property.name), pid, property.type,
+            const std::uint16_t pid =
+                property.key.pid != kNoPropertyId ? property.key.pid : localPid--;
+            record.properties.push_back({property.key.id, wide(property.name), pid, property.type,
                                          property.optional, property.unique});
         }
         records.classes.push_back(record);

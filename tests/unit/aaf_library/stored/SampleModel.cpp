@@ -7,6 +7,7 @@
 #include "aaf_library/stored/ModelTypes.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 
 #include <stdexcept>
