@@ -15,6 +15,7 @@
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
@@ -68,12 +69,7 @@ private:
 
 int DescribeRun::Run() {
     if (!options_.outFolder.empty()) {
-        std::error_code error;
-        std::filesystem::create_directories(options_.outFolder, error);
-        if (error) {
-            throw Failure(kExitCaller, options_.outFolder,
-                          "the folder can't be made: " + error.message());
-        }
+        MakeOutputFolder(options_.outFolder);
     }
     for (const std::filesystem::path& path : options_.paths) {
         std::error_code ignored;

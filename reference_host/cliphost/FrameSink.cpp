@@ -6,6 +6,7 @@
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/PixelsToPicture.h"
 #include "reference_host/cliphost/PngFile.h"
 #include "reference_host/cliphost/Words.h"
@@ -83,11 +84,7 @@ class FolderSink final : public FrameSink {
 public:
     FolderSink(std::filesystem::path folder, std::filesystem::path stem, const PictureTurn& turn)
         : folder_(std::move(folder)), stem_(std::move(stem)), turn_(turn) {
-        std::error_code error;
-        std::filesystem::create_directories(folder_, error);
-        if (error) {
-            throw Failure(kExitCaller, folder_, "the folder can't be made: " + error.message());
-        }
+        MakeOutputFolder(folder_);
     }
 
     void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {

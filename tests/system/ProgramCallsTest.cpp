@@ -68,7 +68,7 @@ TEST_F(ProgramCalls, GoOnAfterADescriptionThatCantBeSaved) {
     const auto second = Copy("png.mov", "b.mov");
     std::filesystem::create_directories(folder() / "out" / "a.aaf");
     ExpectSays(RunCliphost("describe -q --out-dir " + Out("out") + " " + first + " " + second), 2,
-               "a.aaf: not saved: a folder is there");
+               "a.aaf: not written: Is a directory; a folder is there");
     EXPECT_TRUE(std::filesystem::is_regular_file(folder() / "out" / "b.aaf"));
 }
 
@@ -91,7 +91,7 @@ TEST_F(ProgramCalls, LeaveAForeignFileOfASimilarNameAlone) {
 TEST_F(ProgramCalls, SaveDescriptionsInFoldersThatAreThere) {
     const auto movie = Copy("png.mov", "a.mov");
     ExpectSays(RunCliphost("describe -q " + movie + " --aaf " + Out("no/a.aaf")), 2,
-               "there is no folder");
+               "a.aaf: not written: No such file or directory; make the folder ");
     ExpectSays(RunCliphost("describe -q " + movie + " --out-dir " + movie), 2,
                "the folder can't be made");
     EXPECT_EQ(FilesLeft(), 1u);
@@ -171,7 +171,9 @@ TEST_F(ProgramCalls, TellWhenStandardOutputTakesNothing) {
     const CommandResult amid = RunCommand(Program() + " samples --every " +
                                           Quoted(MadeMovie("pcm_u8.mov")) + " 2>&1 >/dev/full");
     EXPECT_EQ(amid.status, 2);
-    EXPECT_EQ(amid.out, "cliphost: standard output: not written: No space left on device\n");
+    EXPECT_EQ(amid.out,
+              "cliphost: standard output: not written: No space left on device; make room there or "
+              "name another place\n");
     EXPECT_EQ(RunCommand(Program() + " describe missing.mov 2>/dev/full").status, 2);
 }
 
