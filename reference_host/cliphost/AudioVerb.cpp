@@ -108,7 +108,7 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     if (form.rate == 0) {
         throw Failure(kExitCaller, options.movie,
                       "its samples a second are not known, since the movie can't be described",
-                      "give --rate, such as --rate 48000");
+                      "give --rate, their number");
     }
     const std::vector<unsigned char> header = WavHeader(form, count);
     if (header.empty()) {

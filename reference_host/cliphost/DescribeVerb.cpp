@@ -207,17 +207,21 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                      "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
                      "same movie gives the same bytes");
     verb->callback([&session, &status, options, pinned] {
-        if (!options->aafFile.empty() &&
-            (options->paths.size() != 1 || std::filesystem::is_directory(options->paths[0]))) {
-            throw Failure(kExitCaller, "--aaf", "it takes one movie", "use --out-dir for several");
-        }
-        if (options->json && OutputFile::IsStandardOutput(options->aafFile)) {
-            throw Failure(kExitCaller, "--aaf", "standard output takes the JSON", "name a file");
-        }
-        SessionOptions withTime = session;
-        withTime.pinTime = *pinned;
-        Session running(withTime);
-        status = DescribeRun(running, *options).Run();
+        AnswerFailureToo(options->json, nlohmann::ordered_json::array(), [&] {
+            if (!options->aafFile.empty() &&
+                (options->paths.size() != 1 || std::filesystem::is_directory(options->paths[0]))) {
+                throw Failure(kExitCaller, "--aaf", "it takes one movie",
+                              "use --out-dir for several");
+            }
+            if (options->json && OutputFile::IsStandardOutput(options->aafFile)) {
+                throw Failure(kExitCaller, "--aaf", "standard output takes the JSON",
+                              "name a file");
+            }
+            SessionOptions withTime = session;
+            withTime.pinTime = *pinned;
+            Session running(withTime);
+            status = DescribeRun(running, *options).Run();
+        });
     });
 }
 

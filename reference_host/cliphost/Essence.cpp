@@ -140,7 +140,8 @@ const ClipTrack& Essence::Track(std::optional<ncfUInt32> number, TrackKind kind)
 std::string Essence::TrackList() const {
     std::string list;
     for (const ClipTrack& track : tracks_) {
-        list += fmt::format("{}{} {}", list.empty() ? "" : ", ", track.number, NameOf(track.kind));
+        list +=
+            fmt::format("{}{} ({})", list.empty() ? "" : ", ", track.number, NameOf(track.kind));
     }
     return tracks_.empty()       ? "it has no tracks"
            : tracks_.size() == 1 ? "its one track is " + list

@@ -97,7 +97,7 @@ Json FormatsOf(Essence& essence) {
         Json json = {{"track", track.number},
                      {"kind", NameOf(track.kind)},
                      {"length", track.length},
-                     {"rate", RateText(track)}};
+                     {"rate", track.RateAsNumber() > 0.0 ? Json(RateText(track)) : Json()}};
         if (const Problem obstacle = essence.Obstacle(track)) {
             AddProblem(obstacle, json);
         } else if (track.kind == TrackKind::Sound) {
@@ -149,7 +149,12 @@ void PrintTrack(const ClipTrack& facts, const Json& track) {
 void Show(Essence& essence, bool json) {
     const Json list = FormatsOf(essence);
     if (json) {
-        PrintJson({{"movie", MachinePath(essence.movie())}, {"tracks", list}});
+        Json answer = {{"movie", MachinePath(essence.movie())}};
+        if (essence.undescribed()) {
+            AddProblem(essence.undescribed(), answer);
+        }
+        answer["tracks"] = list;
+        PrintJson(answer);
         return;
     }
     fmt::print("{}\n", host::DisplayPath(essence.movie()));

@@ -102,7 +102,9 @@ Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) 
     host::LoadFailure failure;
     plugin_ = host_->LoadModule(module, failure);
     if (!plugin_) {
-        throw Failure(kExitCaller, failure.message);
+        throw Failure(
+            kExitCaller,
+            Problem{{}, failure.message, "name another with --plugin FILE", failure.code});
     }
 }
 

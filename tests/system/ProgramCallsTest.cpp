@@ -185,6 +185,45 @@ TEST_F(ProgramCalls, PrintIntoNoFileWhenStandardStreamsAreClosed) {
     EXPECT_EQ(ReadFile(folder() / "closed.wav"), ReadFile(folder() / "open.wav"));
 }
 
+// Also of what fails before any movie is read.
+TEST_F(ProgramCalls, AnswerAFailureInJsonWhateverTheVerb) {
+    const auto movie = Quoted(MadeMovie("png.mov"));
+    for (const std::string& call :
+         {"scan --json " + Out("."), "describe --json " + movie, "samples --json " + movie,
+          "formats --json " + movie, "params --json " + movie, std::string("types --json"),
+          std::string("plugin --json")}) {
+        const CommandResult ran =
+            RunCommand(Program() + " " + call + " --plugin " + Out("no.nvx") + " 2>/dev/null");
+        EXPECT_EQ(ran.status, 2) << call;
+        const Json answer = Json::parse(ran.out, nullptr, false);
+        ASSERT_TRUE(answer.is_structured()) << call << "\n" << ran.out;
+        const Json problem = answer.is_array() ? answer.at(0) : answer;
+        EXPECT_NE(problem["reason"].get<std::string>().find("no.nvx"), std::string::npos) << call;
+        EXPECT_EQ(problem["hint"], "name another with --plugin FILE") << call;
+        EXPECT_EQ(problem["code"], "NCF_E_NOTFOUND") << call;
+        EXPECT_TRUE(problem["route"].is_null()) << call;
+    }
+}
+
+TEST_F(ProgramCalls, TellInJsonWhyAMovieIsMappedWithoutADescription) {
+    // Too short for a frame.
+    const std::string movie = Out("short.mov");
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=r=48000 -af atrim=end_sample=1 "
+                         "-c:a pcm_s16le " +
+                         movie)
+                  .status,
+              0);
+    const CommandResult ran = RunCommand(Program() + " formats --json " + movie + " 2>/dev/null");
+    EXPECT_EQ(ran.status, 0);
+    const Json answer = Json::parse(ran.out);
+    EXPECT_TRUE(answer["reason"].is_string()) << ran.out;
+    EXPECT_TRUE(answer["tracks"][0]["rate"].is_null()) << ran.out;
+    const Json whole =
+        Json::parse(RunCliphost("formats --json " + Quoted(MadeMovie("png.mov"))).out);
+    EXPECT_FALSE(whole.contains("reason"));
+    EXPECT_EQ(whole["tracks"][0]["rate"], "25/1");
+}
+
 TEST_F(ProgramCalls, GiveValidJsonForNamesThatAreNoUtf8) {
     std::filesystem::create_directory(folder() / "f\xFF");
     const auto movie = Copy("png.mov", "f\xFF/b\xFE name.mov");
