@@ -33,6 +33,18 @@ CodecOwner OpenDecoder(const AVStream& stream) {
     return avcodec_open2(codec.get(), decoder, nullptr) < 0 ? nullptr : std::move(codec);
 }
 
+// In place of the one that the demuxer gave, which after a seek may be another's.
+void PutPalette(const Palette& palette, AVPacket& packet) {
+    std::size_t size = 0;
+    std::uint8_t* to = av_packet_get_side_data(&packet, AV_PKT_DATA_PALETTE, &size);
+    if (!to || size != palette.size()) {
+        to = av_packet_new_side_data(&packet, AV_PKT_DATA_PALETTE, palette.size());
+    }
+    if (to) {
+        std::copy(palette.begin(), palette.end(), to);
+    }
+}
+
 bool IsDamaged(const AVFrame& frame) {
     return (frame.flags & AV_FRAME_FLAG_CORRUPT) != 0 || frame.decode_error_flags != 0;
 }
@@ -171,6 +183,9 @@ bool PictureReader::Feed() {
             // next may be good. What is left of one behind a file's end some
             // decoders take for a whole.
             if (!marksCutPackets_ || (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0) {
+                if (at < order_.PacketCount() && order_.Packet(at).palette) {
+                    PutPalette(*order_.Packet(at).palette, *packet_);
+                }
                 avcodec_send_packet(codec_.get(), packet_.get());
             }
         }
