@@ -6,6 +6,7 @@
 #include <algorithm>
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/RasterClaim.h"
 
 namespace host {
 namespace {
@@ -25,6 +26,7 @@ CodecOwner OpenDecoder(const AVStream& stream) {
         return nullptr;
     }
     codec->pkt_timebase = stream.time_base;
+    codec->max_pixels = MostPixels(*stream.codecpar);
     codec->thread_count = 0;  // as many as there are processors
     // Near the end of a stream the decoder would keep good pictures back as well;
     // those that are damaged it marks.
@@ -56,6 +58,10 @@ std::unique_ptr<PictureReader> PictureReader::Open(const std::filesystem::path& 
     std::string ignored;
     InputOwner input = OpenInput(path, InputView::AsPresented, ignored);
     if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
+        return nullptr;
+    }
+    if (TellsLargePictures(*input->streams[stream]->codecpar) &&
+        !FindImpossibleRaster(path, stream).empty()) {
         return nullptr;
     }
     CodecOwner codec = OpenDecoder(*input->streams[stream]);
