@@ -45,6 +45,9 @@ public:
     const ClipTrack& Track(std::optional<ncfUInt32> number, TrackKind kind) const;
     const ClipTrack* First(TrackKind kind) const;
 
+    // Which one of the file's tracks of its kind it is.
+    WhichTrack Which(const ClipTrack& track) const;
+
     // All tracks by number and kind, for people.
     std::string TrackList() const;
 
@@ -66,7 +69,6 @@ public:
 private:
     void Map(NMA::IMediaContainer3& container);
     std::vector<ClipTrack> FindTracks();
-    WhichTrack Which(const ClipTrack& track) const;
 
     Session& session_;
     std::filesystem::path movie_;

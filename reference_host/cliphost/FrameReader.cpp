@@ -41,7 +41,8 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     frameBytes_ = size;
     result = essence_.provider().Setup(track_.number);
     if (result < 0) {
-        essence_.Fail(fmt::format("track {}: the reader does not start", track_.number), result);
+        essence_.FailSamples(
+            track_, fmt::format("track {}: the reader does not start", track_.number), result);
     }
 }
 

@@ -255,6 +255,11 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
     if (!decoder.empty()) {
         return because(decoder, "convert it with a program that knows this codec");
     }
+    if (which.kind != TrackKind::Sound) {
+        if (const std::string raster = host::RasterProblem(movie); !raster.empty()) {
+            return because(raster, "its description is damaged: " + std::string(kCopyAgain));
+        }
+    }
     if (track) {
         if (const std::string missing = WhatIsMissing(header, number, sample); !missing.empty()) {
             return because(missing, kCopyAgain);

@@ -74,12 +74,12 @@ NCFRESULT MeasureRun(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t sa
 }  // namespace
 
 NCFRESULT ReadMappedSample(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t number,
-                           MappedSample& sample) {
+                           MappedSample& sample, TemporalOffsets* offsets) {
     sample = {};
     sample.number = number;
     ncfUInt64 position = 0, flags = 0, runBytes = 0;
     ncfUInt32 dependencies = 0;
-    ncfSInt64 offset = 0, runSamples = 0;
+    ncfSInt64 runSamples = 0;
     NCFRESULT result = SizeOf(map, track, number, sample.size);
     if (result >= 0) {
         result = map.GetSamplePosition(track, number, &position);
@@ -101,9 +101,7 @@ NCFRESULT ReadMappedSample(NMA::ISampleMapping& map, ncfUInt32 track, std::uint6
     sample.dependencies = dependencies;
     sample.contiguousSamples = runSamples;
     sample.contiguousBytes = runBytes;
-    if (map.GetSampleTemporalOffset(track, number, &offset) >= 0) {
-        sample.temporalOffset = offset;
-    }
+    sample.temporalOffset = offsets ? offsets->Of(number) : AskOffset(map, track, number);
     return NCF_OK;
 }
 

@@ -74,12 +74,16 @@ void SamplesRun::ShowSamples(const ClipTrack& track, std::uint64_t count, Json& 
         fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", "sample", "position", "size",
                    "offset", "properties", "bytes that follow each other");
     }
+    TemporalOffsets offsets(essence_.map(), track.number, [&] {
+        return DisplayTimesOf(essence_.movie(), essence_.Which(track));
+    });
     for (std::uint64_t i = 0; i < count; ++i) {
         if (i % kStep == 0) {
             progress.Step(fmt::format("{}", i));
         }
         MappedSample sample;
-        const NCFRESULT result = ReadMappedSample(essence_.map(), track.number, i, sample);
+        const NCFRESULT result =
+            ReadMappedSample(essence_.map(), track.number, i, sample, &offsets);
         if (result < 0) {
             essence_.Fail(fmt::format("track {}: sample {} can't be mapped", track.number, i),
                           result);

@@ -4,6 +4,7 @@
 #include "reference_host/quicktime/OpenProblem.h"
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/RasterClaim.h"
 
 extern "C" {
 #include <libavcodec/avcodec.h>
@@ -39,6 +40,21 @@ std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std:
         return "track " + std::to_string(i + 1) +
                " of the file: no decoder is known for its codec '" + code + "'" +
                (known ? std::string(", ") + known->long_name : std::string());
+    }
+    return {};
+}
+
+std::string RasterProblem(const std::filesystem::path& path) {
+    std::string reason;
+    const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
+    for (unsigned i = 0; input && i < input->nb_streams; ++i) {
+        const AVStream& stream = *input->streams[i];
+        if (stream.codecpar->codec_type == AVMEDIA_TYPE_VIDEO &&
+            (stream.disposition & AV_DISPOSITION_ATTACHED_PIC) == 0) {
+            const std::string claim = FindImpossibleRaster(path, static_cast<int>(i));
+            return claim.empty() ? claim
+                                 : "track " + std::to_string(i + 1) + " of the file: " + claim;
+        }
     }
     return {};
 }

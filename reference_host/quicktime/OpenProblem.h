@@ -15,4 +15,8 @@ std::string OpenProblem(const std::filesystem::path& path);
 // among the tracks of its kind.
 std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place);
 
+// Why the first picture track can't have pictures as large as the file tells; empty
+// when it can.
+std::string RasterProblem(const std::filesystem::path& path);
+
 }  // namespace host

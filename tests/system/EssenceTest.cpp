@@ -52,6 +52,52 @@ constexpr const char* kPictures[] = {"h264_bframes.mov",
                                      "one_picture.mov",
                                      "three_sounds.mov"};
 
+// Asked sample by sample, the module says what the program works out at once, also
+// where pictures are displayed far away or nowhere.
+void ExpectOffsetsOfTheModule(Essence& essence) {
+    const ClipTrack& track = *essence.First(TrackKind::Picture);
+    const auto worked =
+        cliphost::WorkOutOffsets(cliphost::DisplayTimesOf(essence.movie(), essence.Which(track)));
+    ncfUInt64 count = 0;
+    ASSERT_EQ(essence.map().GetNumberOfSamples(track.number, &count), NCF_OK);
+    ASSERT_EQ(worked.size(), count);
+    for (ncfUInt64 i = 0; i < count; ++i) {
+        ASSERT_EQ(worked[i], cliphost::AskOffset(essence.map(), track.number, i)) << i;
+    }
+}
+
+TEST_F(EssenceMap, FindsTheOffsetsThatTheModuleTellsOneByOne) {
+    movies::VideoFormat format;
+    format.codec = "mp4v";
+    for (const std::int32_t step : {0, 1, 7, 450, 1001, -333}) {
+        SCOPED_TRACE(step);
+        movies::Movie movie;
+        movie.tracks.push_back(movies::VideoTrack(format, 0, 25000, 1000, 10));
+        for (std::int32_t i = 0; i < 300; ++i) {
+            movies::SampleRun run;
+            run.size = 10;
+            run.duration = i % 50 == 3 ? 900 : 1000;
+            run.displayOffset = (i * 37 % 11) * 1000 + i * step;
+            movie.tracks[0].samples.push_back(run);
+        }
+        movie.tracks[0].offsetVersion = 1;
+        Essence essence(session(), Write(movie, std::to_string(step) + ".mov"));
+        ExpectOffsetsOfTheModule(essence);
+    }
+}
+
+TEST_F(EssenceMap, FindsTheOffsetsOfMoviesThatTheLibraryReads) {
+    const auto movie = folder() / "fragments.mp4";
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=160x90:r=25:d=4 -vf "
+                         "'setpts=(N+N*N/8)/25/TB' -vsync passthrough -c:v libx264 -bf 3 "
+                         "-pix_fmt yuv420p -movflags frag_keyframe+empty_moov " +
+                         Quoted(movie))
+                  .status,
+              0);
+    Essence essence(session(), movie);
+    ExpectOffsetsOfTheModule(essence);
+}
+
 TEST_F(EssenceMap, TellsWhereEveryPictureLies) {
     for (const char* const name : kPictures) {
         SCOPED_TRACE(name);

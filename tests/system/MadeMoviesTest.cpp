@@ -84,6 +84,10 @@ struct Profile {
     const char* code;
 };
 
+void PrintTo(const Profile& profile, std::ostream* to) {
+    *to << profile.code;
+}
+
 class ProRes : public SystemTest, public testing::WithParamInterface<Profile> {};
 
 TEST_P(ProRes, IsNativeAtEveryRaster) {
