@@ -78,6 +78,14 @@ protected:
                 << count << " from " << at;
         }
     }
+    // `got` is a piece of one channel's `whole`, from `frame` on.
+    static void ExpectIn(const EssenceBytes& whole, const EssenceBytes& got, std::size_t frame) {
+        ASSERT_GE(whole.size(), frame * 3 + got.size());
+        const auto from = whole.begin() + static_cast<std::ptrdiff_t>(frame * 3);
+        const auto differs = std::mismatch(got.begin(), got.end(), from);
+        EXPECT_TRUE(differs.first == got.end())
+            << "from frame " << (differs.first - got.begin()) / 3;
+    }
     // `wanted` may go on behind the clip's length, by less than an edit unit.
     static void ExpectSame(const EssenceBytes& got, const EssenceBytes& wanted) {
         ASSERT_GE(got.size(), 1000u);
@@ -334,41 +342,56 @@ TEST_F(SoundForms, KeepAGapWhileTheRateIsConverted) {
     EXPECT_FALSE(isSilent(18 * 1024 + 22050, 19 * 1024 + 22050));
 }
 
-// The edit begins within a packet: what is left of that one is followed by the
-// next as it is in the whole.
-TEST_F(SoundForms, AreContinuousFromAnEditWithinAPacket) {
+// The edit begins within a packet, in units that are the sound's frames or not:
+// what is heard is what the media holds from there on, from its first frame.
+TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditWithinAPacket) {
     const auto plain =
         Make("-f lavfi -i sine=440:d=3:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
     const SoundPackets packets = SoundPacketsOf(plain);
     const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
     const EssenceBytes whole =
-        Delivered(WriteSound(SoundTrackOf(packets, format, 48000, 1115), "whole.mov"));
-    for (const std::int64_t start : {1500, 1800, 2230, 3000}) {
+        Delivered(WriteSound(SoundTrackOf(packets, format, 44100, 1024), "whole.mov"));
+    struct Units {
+        std::uint32_t scale, packet;
+    };
+    for (const Units& units : {Units{48000, 1115}, Units{44100, 1024}}) {
+        for (const std::int64_t start : {1, 500, 1023, 1114, 1115, 1500, 1800, 2230, 3000}) {
+            SCOPED_TRACE(std::to_string(start) + " of " + std::to_string(units.scale));
+            movies::Track track = SoundTrackOf(packets, format, units.scale, units.packet);
+            movies::Edit edit;
+            edit.duration = 2 * 44100;
+            edit.mediaTime = start;
+            track.edits = {edit};
+            const auto movie = WriteSound(track, "cut.mov");
+            const EssenceBytes got = Delivered(movie);
+            ASSERT_EQ(got.size(), 2u * 44100 * 3);
+            const std::int64_t frame = (start * 44100 + units.scale / 2) / units.scale;
+            ExpectIn(whole, got, static_cast<std::size_t>(frame));
+            ExpectRangesOf(movie, got);
+        }
+    }
+}
+
+// The units are those of the core, of which the decoder makes two frames each.
+TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditInUnitsOfTheCore) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=3:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = SoundPacketsOf(plain);
+    const movies::SoundFormat format =
+        Mpeg4Sound(0x40, {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x00}, 1, 22050);
+    const EssenceBytes whole =
+        Delivered(WriteSound(SoundTrackOf(packets, format, 22050, 1024), "whole.mov"));
+    for (const std::int64_t start : {500, 1024, 2624}) {
         SCOPED_TRACE(start);
-        movies::Track track = SoundTrackOf(packets, format, 48000, 1115);
+        movies::Track track = SoundTrackOf(packets, format, 22050, 1024);
         movies::Edit edit;
         edit.duration = 2 * 44100;
         edit.mediaTime = start;
         track.edits = {edit};
         const auto movie = WriteSound(track, "cut.mov");
         const EssenceBytes got = Delivered(movie);
-        ASSERT_GE(got.size(), 40u * 1024 * 3);
-        // Behind the first packets, on which the start of decoding tells.
-        const auto piece = got.begin() + 6000 * 3;
-        const auto found = std::search(whole.begin(), whole.end(), piece, piece + 90);
-        ASSERT_NE(found, whole.end());
-        EXPECT_NEAR(static_cast<double>(found - whole.begin()) / 3 - 6000,
-                    static_cast<double>(start) * 44.1 / 48, 3);
-        const std::size_t count =
-            std::min<std::size_t>(static_cast<std::size_t>(got.end() - piece),
-                                  static_cast<std::size_t>(whole.end() - found));
-        EXPECT_TRUE(std::equal(piece, piece + static_cast<std::ptrdiff_t>(count), found));
-        const auto isHeard = [&](std::size_t i) {
-            return got[i * 3] || got[i * 3 + 1] || got[i * 3 + 2];
-        };
-        for (std::size_t i = 1000; i < 6000; ++i) {
-            EXPECT_TRUE(isHeard(i) || isHeard(i + 1)) << "a gap at " << i;
-        }
+        ASSERT_EQ(got.size(), 2u * 44100 * 3);
+        ExpectIn(whole, got, static_cast<std::size_t>(start * 2));
         ExpectRangesOf(movie, got);
     }
 }
