@@ -522,23 +522,27 @@ TEST_F(SoundForms, OfIsoLinearSoundAreLinear) {
         const auto raw = Make(
             "-f lavfi -i sine=440:d=0.2:sample_rate=48000 -ac 2 -f " + std::string(kind.source),
             "raw");
-        movies::SoundFormat format;
-        format.codec = kind.codec;
-        format.bits = kind.bits;
-        format.extensions = {
-            movies::Box("pcmC").Version(0).U8(kind.isLittle ? 1 : 0).U8(kind.bits)};
-        movies::Track track = movies::SoundTrack(format, 9600);
-        track.samples[0].size = kind.bits / 8 * 2;
-        track.data = ReadFile(raw);
-        ASSERT_EQ(track.data.size(), 9600u * kind.bits / 8 * 2);
-        const auto movie = WriteSound(track, "linear.mov");
-        const std::string line = SoundLine(Describe(movie));
-        EXPECT_EQ(line.substr(0, std::string(kind.label).size()), kind.label) << line;
-        EXPECT_NE(line.find(" 9600 samples"), std::string::npos) << line;
         const CommandResult wanted =
             RunCommand("ffmpeg -nostdin -v quiet -f " + std::string(kind.source) +
                        " -ar 48000 -ac 2 -i " + Quoted(raw) + " -f s24le -c:a pcm_s24le -");
-        ExpectSame(Delivered(movie), {wanted.out.begin(), wanted.out.end()});
+        for (const unsigned version : {0u, 1u, 2u}) {
+            SCOPED_TRACE("version " + std::to_string(version));
+            movies::SoundFormat format;
+            format.codec = kind.codec;
+            format.version = version;
+            format.bits = kind.bits;
+            format.extensions = {
+                movies::Box("pcmC").Version(0).U8(kind.isLittle ? 1 : 0).U8(kind.bits)};
+            movies::Track track = movies::SoundTrack(format, 9600);
+            track.samples[0].size = kind.bits / 8 * 2;
+            track.data = ReadFile(raw);
+            ASSERT_EQ(track.data.size(), 9600u * kind.bits / 8 * 2);
+            const auto movie = WriteSound(track, "linear.mov");
+            const std::string line = SoundLine(Describe(movie));
+            EXPECT_EQ(line.substr(0, std::string(kind.label).size()), kind.label) << line;
+            EXPECT_NE(line.find(" 9600 samples"), std::string::npos) << line;
+            ExpectSame(Delivered(movie), {wanted.out.begin(), wanted.out.end()});
+        }
     }
 }
 
