@@ -130,6 +130,9 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
     if (const std::string missing = WhatAnyTrackMisses(header); !missing.empty()) {
         return {movie, missing, kCopyAgain};
     }
+    if (const std::string opening = host::OpenProblem(movie); !opening.empty()) {
+        return {movie, "the multimedia library, which decodes it, refuses it: " + opening};
+    }
     return {};
 }
 

@@ -501,6 +501,29 @@ TEST_F(SoundForms, OfFragmentsAreThoseOfTheDescriptionInUse) {
     ExpectSame(got, wanted);
 }
 
+// Each description tells of one channel, each packet holds two: together they are
+// more than a movie may have, and the reason is told by whatever verb.
+TEST_F(SoundForms, ThatTakeMoreChannelsTogetherThanAreToldAreRefused) {
+    const auto two = Make(kHum + std::string("44100 -ac 2 -c:a libmp3lame -write_xing 0 "
+                                             "-id3v2_version 0"),
+                          "two.mp3");
+    movies::SoundFormat format;
+    format.codec = ".mp3";
+    format.channels = 1;
+    format.rate = 44100;
+    movies::Movie movie;
+    movie.timeScale = 44100;
+    SoundPackets packets = SoundPacketsOf(two);
+    packets.resize(8);
+    movie.tracks.assign(513, SoundTrackOf(packets, format, 44100, 1152));
+    const auto path = Write(movie, "many.mov");
+    for (const char* const verb : {"describe ", "formats ", "samples "}) {
+        ExpectSays(RunCliphost(verb + Quoted(path)), 1,
+                   "many.mov: the multimedia library, which decodes it, refuses it: the sounds of "
+                   "the movie have more than 1024 channels together");
+    }
+}
+
 // Linear sound of the ISO forms is read by the host itself where its depth is
 // one that the host takes, and comes bit for bit out of the provider.
 TEST_F(SoundForms, OfIsoLinearSoundAreLinear) {
