@@ -501,6 +501,31 @@ TEST_F(SoundForms, OfFragmentsAreThoseOfTheDescriptionInUse) {
     ExpectSame(got, wanted);
 }
 
+// A movie in fragments has an edit that leaves out what primes the decoder, or
+// nothing but the decoder's configuration tells of it. A picture that begins with
+// the priming keeps its distance to the sound.
+TEST_F(SoundForms, InFragmentsAreWithoutThePrimingOfOpus) {
+    struct Kind {
+        const char* flags;
+        const char* picture;
+        std::size_t silence;
+    };
+    const char* const picture = "-f lavfi -i testsrc=d=2:s=64x64:r=25 -c:v mpeg4 ";
+    for (const Kind& kind : {Kind{"empty_moov", "", 0}, Kind{"delay_moov", "", 0},
+                             Kind{"empty_moov", picture, 312}, Kind{"delay_moov", picture, 0}}) {
+        SCOPED_TRACE(kind.flags + std::string(kind.picture));
+        const auto movie =
+            Make("-f lavfi -i sine=440:b=4:d=2:sample_rate=48000 " + std::string(kind.picture) +
+                     "-c:a libopus -movflags frag_keyframe+" + kind.flags,
+                 "fragments.mp4");
+        const CommandResult heard = RunCommand("ffmpeg -nostdin -v quiet -i " + Quoted(movie) +
+                                               " -f s24le -c:a pcm_s24le -");
+        EssenceBytes wanted(kind.silence * 3);
+        wanted.insert(wanted.end(), heard.out.begin(), heard.out.end());
+        ExpectSame(Delivered(movie), wanted);
+    }
+}
+
 // Each description tells of one channel, each packet holds two: together they are
 // more than a movie may have, and the reason is told by whatever verb.
 TEST_F(SoundForms, ThatTakeMoreChannelsTogetherThanAreToldAreRefused) {
