@@ -227,7 +227,12 @@ TEST_F(SoundForms, OfAnnouncedExtensionsOfAacAreThoseThatComeOut) {
           Kind{"bands, told behind, no stereo", {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x00}, "1"},
           Kind{"stereo, told behind", {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x80}, "2"},
           Kind{"bands, told in front", {0x2B, 0x8A, 0x08, 0x00}, "2"},
-          Kind{"stereo, told in front", {0xEB, 0x8A, 0x08, 0x00}, "2"}}) {
+          Kind{"stereo, told in front", {0xEB, 0x8A, 0x08, 0x00}, "2"},
+          // The extension names 24000, between the core's rate and twice that.
+          Kind{"bands of an odd rate, told in front", {0x2B, 0x8B, 0x08, 0x00}, "2"},
+          Kind{"bands of an odd rate, told behind", {0x13, 0x88, 0x56, 0xE5, 0xB0}, "2"},
+          // 96000, more than twice the core's.
+          Kind{"bands of a high rate, told in front", {0x2B, 0x88, 0x08, 0x00}, "2"}}) {
         for (const bool isWave : {false, true}) {
             SCOPED_TRACE(kind.name + std::string(isWave ? " in wave" : ""));
             movies::SoundFormat format = Mpeg4Sound(0x40, kind.config, 2, 22050);
@@ -524,6 +529,22 @@ TEST_F(SoundForms, InFragmentsAreWithoutThePrimingOfOpus) {
         wanted.insert(wanted.end(), heard.out.begin(), heard.out.end());
         ExpectSame(Delivered(movie), wanted);
     }
+}
+
+// Blocks that say they hold no data: the ffmpeg command gives no sound for them
+// either, and no file of silence is left.
+TEST_F(SoundForms, OfTelephoneBlocksWithoutDataAreRefused) {
+    movies::SoundFormat format;
+    format.codec = "samr";
+    format.channels = 1;
+    format.rate = 8000;
+    const auto movie = WriteSound(
+        SoundTrackOf(SoundPackets(50, Bytes(50, 0x7C)), format, 8000, 8000), "empty.mov");
+    const auto wav = folder() / "a.wav";
+    ExpectSays(RunCliphost("audio " + Quoted(movie) + " -o " + Quoted(wav)), 1,
+               "none of its samples from 0 to 399999 could be read");
+    EXPECT_FALSE(std::filesystem::exists(wav));
+    EXPECT_EQ(RunCommand("ffmpeg -nostdin -v quiet -i " + Quoted(movie) + " -f s16le -").out, "");
 }
 
 // Each description tells of one channel, each packet holds two: together they are
