@@ -10,6 +10,7 @@
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
+#include "reference_host/cliphost/MissingMedia.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Problem.h"
@@ -65,6 +66,12 @@ public:
     // Why a sample of a track could not be read; what is said where nothing but the
     // decoder could tell.
     Problem WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESULT result) const;
+
+    // The part of a sound track that the file is too short for, by the samples a
+    // second that are delivered.
+    MissingSound MissingPart(const ClipTrack& track, unsigned rate) const {
+        return {movie_, Which(track).place, rate};
+    }
 
 private:
     void Map(NMA::IMediaContainer3& container);

@@ -10,6 +10,7 @@
 #include <optional>
 
 #include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/MissingMedia.h"
 #include "reference_host/header_parser/InspectHeaders.h"
 #include "reference_host/header_parser/Verdict.h"
 #include "reference_host/quicktime/OpenProblem.h"
@@ -88,44 +89,8 @@ Problem WithoutRate(const std::filesystem::path& movie, const HeaderReport& head
     return {movie, RateWords(header), SoundHint(header)};
 }
 
-bool IsInFile(const Track& track) {
-    return !track.isInFile.empty() &&
-           std::find(track.isInFile.begin(), track.isInFile.end(), false) == track.isInFile.end();
-}
-
-// Which samples of a track the file is too short for, where `sample` is one of
-// them. Samples follow each other in the file.
-std::string WhatIsMissing(const HeaderReport& header, std::size_t place, std::uint64_t sample) {
-    const Track& track = header.movie->tracks[place];
-    const auto isThere = [&](ncfUInt32 i) {
-        return track.samples.PositionOf(i) + track.samples.Sizes().SizeOf(i) <= header.fileSize;
-    };
-    const ncfUInt32 count = track.samples.Count();
-    if (count == 0 || !IsInFile(track) || isThere(count - 1)) {
-        return {};
-    }
-    ncfUInt32 first = 0;  // that is missing
-    for (ncfUInt32 end = count - 1; first < end;) {
-        const ncfUInt32 middle = first + (end - first) / 2;
-        isThere(middle) ? first = middle + 1 : end = middle;
-    }
-    if (sample < first) {
-        return {};
-    }
-    const ncfUInt64 begin = track.samples.PositionOf(0);
-    if (begin >= header.fileSize) {
-        return fmt::format(
-            "track {} of the file: its samples begin at byte {}, the file ends at byte {}",
-            place + 1, begin, header.fileSize);
-    }
-    return fmt::format(
-        "track {} of the file: the file ends at byte {}, so samples {} to {} of its table are "
-        "missing or cut off",
-        place + 1, header.fileSize, first, count - 1);
-}
-
-// The same of the first track that misses some.
-std::string WhatIsMissing(const HeaderReport& header) {
+// What the first track misses that misses some.
+std::string WhatAnyTrackMisses(const HeaderReport& header) {
     for (std::size_t i = 0; i < header.movie->tracks.size(); ++i) {
         const ncfUInt32 count = header.movie->tracks[i].samples.Count();
         if (const std::string missing = WhatIsMissing(header, i, count); !missing.empty()) {
@@ -162,8 +127,11 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
     if (const std::string empty = WhatIsEmpty(header); !empty.empty()) {
         return {movie, empty};
     }
-    if (const std::string missing = WhatIsMissing(header); !missing.empty()) {
+    if (const std::string missing = WhatAnyTrackMisses(header); !missing.empty()) {
         return {movie, missing, kCopyAgain};
+    }
+    if (const std::string opening = host::OpenProblem(movie); !opening.empty()) {
+        return {movie, "the multimedia library, which decodes it, refuses it: " + opening};
     }
     return {};
 }

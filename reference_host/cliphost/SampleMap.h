@@ -42,7 +42,8 @@ struct SampleRun {
 
 // The runs of a track, with what was found wrong with them: every run must lie
 // inside the file, its bytes must be the sum of its samples' sizes, and the runs
-// must hold every sample once.
+// must hold every sample once. Samples at one place are those of one packet, whose
+// size each of them has.
 struct RunMap {
     std::uint64_t samples = 0;
     std::uint64_t bytes = 0;  // of all samples

@@ -156,6 +156,11 @@ ncfUInt32 SampleTimes::DurationOf(ncfUInt32 sample) const {
     return Duration(hasOneDuration_ ? 0 : DurationRunOf(sample).entry);
 }
 
+ncfUInt64 SampleTimes::DecodeTimeOf(ncfUInt32 sample) const {
+    const DurationRun run = DurationRunOf(sample);
+    return run.decodeTime + ncfUInt64{sample - run.first} * Duration(run.entry);
+}
+
 ncfSInt64 SampleTimes::DisplayOffsetOf(ncfUInt32 sample) const {
     return offsets_ == nullptr ? 0 : Offset(OffsetRunOf(sample).entry) - shift_;
 }

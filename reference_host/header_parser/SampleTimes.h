@@ -25,6 +25,7 @@ public:
     Verdict Read(const Atom& durations, const Atom& offsets, ncfUInt32 sampleCount);
 
     ncfUInt32 DurationOf(ncfUInt32 sample) const;
+    ncfUInt64 DecodeTimeOf(ncfUInt32 sample) const;
     // Shifted so that the first picture shown has the decode time of the
     // first sample, which is 0.
     ncfSInt64 DisplayOffsetOf(ncfUInt32 sample) const;

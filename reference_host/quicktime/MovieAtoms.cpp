@@ -177,22 +177,30 @@ private:
             const ncfUInt64 count = Number(bytes + 4, 4);
             out_.tracks.back().descriptionCount =
                 static_cast<ncfUInt32>(count < most ? count : most);
-            ReadFirstDescription(position + 8, end, depth);
+            ReadFirstDescription(position + 8, end, bytes[0] != 0, depth);
         }
     }
 
-    // Of the one kind of sound whose form stands in an atom behind the fields.
-    void ReadFirstDescription(ncfUInt64 position, ncfUInt64 end, int depth) {
+    // Of the one kind of sound whose form stands in an atom behind the fields. In
+    // a list of the ISO form version 1 adds none.
+    void ReadFirstDescription(ncfUInt64 position, ncfUInt64 end, bool isIso, int depth) {
         constexpr ncfUInt64 kFields = 36;
-        ncfUInt8 bytes[8];
-        if (end - position < kFields || !Read(position, bytes, sizeof bytes)) {
+        constexpr ncfUInt64 kFieldsOfVersion1 = kFields + 16;
+        constexpr ncfUInt64 kFieldsOfVersion2 = kFields + 36;
+        ncfUInt8 bytes[kFields + 4];
+        if (end - position < sizeof bytes || !Read(position, bytes, sizeof bytes)) {
             return;
         }
         const ncfUInt64 size = Number(bytes, 4);
         const ncfUInt64 code = Number(bytes + 4, 4);
+        const ncfUInt64 version = Number(bytes + 16, 2);
+        const ncfUInt64 fields = version == 2
+                                     ? std::max(kFieldsOfVersion2, Number(bytes + kFields, 4))
+                                 : version == 1 && !isIso ? kFieldsOfVersion1
+                                                          : kFields;
         const bool isLinear = code == Code("ipcm") || code == Code("fpcm");
-        if (isLinear && size >= kFields && size <= end - position) {
-            Descend(position + kFields, position + size, depth);
+        if (isLinear && size >= fields && size <= end - position) {
+            Descend(position + fields, position + size, depth);
         }
     }
 

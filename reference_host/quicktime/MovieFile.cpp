@@ -12,6 +12,7 @@ extern "C" {
 #include <fstream>
 #include <iterator>
 #include <limits>
+#include <numeric>
 #include <set>
 
 #include "reference_host/header_parser/QTParser.h"
@@ -95,7 +96,36 @@ bool HeaderIsRead(const std::filesystem::path& path) {
 
 std::unique_ptr<MovieFile> MovieFile::Open(const std::filesystem::path& path, std::string& reason) {
     InputOwner input = OpenInput(path, InputView::AsPresented, reason);
-    return input ? std::unique_ptr<MovieFile>(new MovieFile(path, std::move(input))) : nullptr;
+    if (!input) {
+        return nullptr;
+    }
+    std::unique_ptr<MovieFile> movie(new MovieFile(path, std::move(input)));
+    if (movie->HasTooManyChannels()) {
+        reason = TooManyChannels();
+        return nullptr;
+    }
+    return movie;
+}
+
+// Those that come out of the decoders, which may be more than the headers tell.
+// They are only counted where so many could come.
+bool MovieFile::HasTooManyChannels() {
+    constexpr int kMostOfADecoder = 64;  // where the container tells less
+    int possible = 0;
+    for (unsigned i = 0; i < input_->nb_streams; ++i) {
+        const AVCodecParameters& form = *input_->streams[i]->codecpar;
+        if (form.codec_type == AVMEDIA_TYPE_AUDIO) {
+            possible += std::max(form.ch_layout.nb_channels, kMostOfADecoder);
+        }
+    }
+    if (possible <= kMostChannelsOfMovie) {
+        return false;
+    }
+    soundForms_ = ReadSoundForms(path_, *input_, IndexIsWhole());
+    const auto channels = std::accumulate(
+        soundForms_->begin(), soundForms_->end(), ncfUInt64{0},
+        [](ncfUInt64 sum, const auto& sound) { return sum + sound.second.channels; });
+    return channels > kMostChannelsOfMovie;
 }
 
 MovieFile::MovieFile(std::filesystem::path path, InputOwner input)

@@ -77,6 +77,7 @@ public:
 
 private:
     MovieFile(std::filesystem::path path, InputOwner input);
+    bool HasTooManyChannels();
     void NumberTracks();
     ncfUInt32 IdOf(unsigned stream) const;  // 0 for none
     bool NeedsPacketTimes() const;

@@ -24,8 +24,6 @@ namespace {
 // The largest block that the library may ask for. A picture of 16384 x 16384
 // with an alpha takes all of it.
 constexpr std::size_t kLargestBlock = std::size_t{1} << 30;
-// Of all sounds of a movie together, as the header parser has it.
-constexpr int kMostChannels = 1024;
 
 constexpr int kBufferBytes = 32768;
 
@@ -141,9 +139,9 @@ void NameFloatSound(AVFormatContext& input, const std::filesystem::path& path) {
 
 int CountChannels(const AVFormatContext& input) {
     int channels = 0;
-    for (unsigned i = 0; i < input.nb_streams && channels <= kMostChannels; ++i) {
+    for (unsigned i = 0; i < input.nb_streams && channels <= kMostChannelsOfMovie; ++i) {
         const int more = input.streams[i]->codecpar->ch_layout.nb_channels;
-        channels += std::clamp(more, 0, kMostChannels + 1);
+        channels += std::clamp(more, 0, kMostChannelsOfMovie + 1);
     }
     return channels;
 }
@@ -153,14 +151,18 @@ std::string FindFault(const AVFormatContext& input) {
     if (input.nb_streams == 0) {
         return "the file holds no tracks";
     }
-    if (CountChannels(input) > kMostChannels) {
-        return "the sounds of the movie have more than " + std::to_string(kMostChannels) +
-               " channels together";
+    if (CountChannels(input) > kMostChannelsOfMovie) {
+        return TooManyChannels();
     }
     return {};
 }
 
 }  // namespace
+
+std::string TooManyChannels() {
+    return "the sounds of the movie have more than " + std::to_string(kMostChannelsOfMovie) +
+           " channels together";
+}
 
 void CloseInput::operator()(AVFormatContext* context) const {
     AVIOContext* const bytes = context->pb;  // the library closes none that it was given
@@ -201,7 +203,7 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     if (IsMovieFamily(*input)) {
         NameFloatSound(*input, path);
     }
-    if (CountChannels(*input) <= kMostChannels && !AreStreamsKnown(*input)) {
+    if (CountChannels(*input) <= kMostChannelsOfMovie && !AreStreamsKnown(*input)) {
         FindStreamDetails(*input);
     }
     reason = FindFault(*input);

@@ -3,6 +3,7 @@
 
 #include "reference_host/quicktime/OpenProblem.h"
 
+#include "reference_host/quicktime/MovieFile.h"
 #include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/RasterClaim.h"
 
@@ -15,7 +16,7 @@ namespace host {
 
 std::string OpenProblem(const std::filesystem::path& path) {
     std::string reason;
-    return OpenInput(path, InputView::AsPresented, reason) ? std::string() : reason;
+    return MovieFile::Open(path, reason) ? std::string() : reason;
 }
 
 std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place) {

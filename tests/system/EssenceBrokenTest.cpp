@@ -206,6 +206,45 @@ TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
     EXPECT_EQ(Decoded(wav, "-f s24le -c:a pcm_s24le").size(), 192000u * 3);
 }
 
+// The end of the file lies within what is read at a time, so the module gives no
+// sign of it. What is hashed lies in front of the cut: the movie has a description.
+TEST_F(EssenceBroken, SoundThatIsCutWithinABlockIsToldWithItsCount) {
+    for (const char* const codec : {"pcm_s16le", "aac -aac_pns 0", "alac"}) {
+        SCOPED_TRACE(codec);
+        const auto whole = folder() / "whole.mov";
+        ASSERT_EQ(
+            RunCommand("ffmpeg -nostdin -v error -y -f lavfi -i testsrc=d=3:r=25:s=64x64 -f lavfi "
+                       "-i sine=r=48000:d=3 -c:v mjpeg -movflags +faststart -c:a " +
+                       std::string(codec) + " " + Quoted(whole))
+                .status,
+            0);
+        const auto cut = Cut(whole, 0.9);
+        const auto wav = folder() / "a.wav";
+        const CommandResult result = RunCliphost("audio " + Quoted(cut) + " -o " + Quoted(wav));
+        const EssenceBytes got = Decoded(wav, "-f s24le -c:a pcm_s24le");
+        ASSERT_EQ(got.size(), 144000u * 3);
+        const auto heard = std::find_if(got.rbegin(), got.rend(), [](auto byte) { return byte; });
+        const auto silent = static_cast<std::size_t>(heard - got.rbegin()) / 3;
+        EXPECT_GT(silent, 5000u);
+        ExpectSays(result, 1,
+                   "track 2 of the file: the file ends at byte " +
+                       std::to_string(std::filesystem::file_size(cut)) + ", so samples ");
+        ExpectSays(result, 1,
+                   "are missing or cut off; silence stands in place of " + std::to_string(silent) +
+                       " of 144000 samples");
+        // In front of it nothing is amiss.
+        const CommandResult front =
+            RunCliphost("audio " + Quoted(cut) + " --count " + std::to_string(144000 - silent) +
+                        " -o " + Quoted(wav));
+        EXPECT_EQ(front.status, 0) << front.out;
+        EXPECT_EQ(front.out.find("missing"), std::string::npos) << front.out;
+        // One more is.
+        ExpectSays(RunCliphost("audio " + Quoted(cut) + " --count " +
+                               std::to_string(144001 - silent) + " -o " + Quoted(wav)),
+                   1, "silence stands in place of 1 of ");
+    }
+}
+
 TEST_F(EssenceBroken, SoundOfWhichNothingCanBeReadLeavesNoFile) {
     const auto cut = Cut(HeaderFirst("pcm_s16le.mov"), 0.2);
     for (const char* const output : {"a.wav", "b.wav"}) {

@@ -189,6 +189,38 @@ TEST_F(EssenceMap, OfPcmHoldsThePacketsOneBehindTheOther) {
     }
 }
 
+// A header counts sound that is coded in blocks frame by frame, so each frame has
+// the place of its block, and all of them are one run here.
+TEST_F(EssenceMap, OfBlocksOfSoundHoldsEachBlockOnce) {
+    for (const char* const codec : {"adpcm_ima_wav", "adpcm_ms"}) {
+        SCOPED_TRACE(codec);
+        const auto movie = folder() / (std::string(codec) + ".mov");
+        ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=440:d=1 -ac 2 -c:a " +
+                             std::string(codec) + " " + Quoted(movie))
+                      .status,
+                  0);
+        const auto packets = PacketsOf(movie, "a:0");
+        ASSERT_GT(packets.size(), 10u);
+        Essence essence(session(), movie);
+        const auto runs = cliphost::ReadRuns(essence.map(), 0, std::filesystem::file_size(movie));
+        EXPECT_TRUE(runs.faults.empty());
+        ASSERT_EQ(runs.runs.size(), 1u);
+        EXPECT_EQ(runs.runs[0].count, runs.samples);
+        EXPECT_EQ(runs.runs[0].position, packets.front().position);
+        EXPECT_EQ(runs.bytes, std::accumulate(packets.begin(), packets.end(), std::uint64_t{0},
+                                              [](std::uint64_t sum, const Packet& packet) {
+                                                  return sum + packet.size;
+                                              }));
+        const auto inBlock = static_cast<std::uint64_t>(packets[1].time - packets[0].time);
+        for (std::size_t i = 0; i < packets.size(); ++i) {
+            cliphost::MappedSample sample;
+            ASSERT_EQ(cliphost::ReadMappedSample(essence.map(), 0, i * inBlock, sample), NCF_OK);
+            EXPECT_EQ(sample.position, packets[i].position) << i;
+            EXPECT_EQ(sample.size, packets[i].size) << i;
+        }
+    }
+}
+
 TEST_F(EssenceMap, HasSumsThatAgreeWithTheFileForEveryMovie) {
     int tracks = 0;
     for (const auto& entry : std::filesystem::directory_iterator(MadeMoviesFolder())) {

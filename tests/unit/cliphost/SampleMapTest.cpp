@@ -94,14 +94,15 @@ public:
         return NCF_OK;
     }
     NCFRESULT GetNumberOfContiguousBytes(ncfUInt32, ncfUInt64 sample, ncfUInt64* bytes) override {
-        ncfUInt64 sum = 0;
+        const ncfUInt64 begin = samples_.at(sample).position;
+        Stored last{};
         do {
-            sum += samples_.at(sample).size;
+            last = samples_[sample];
             ++sample;
         } while (sample < samples_.size() &&
-                 samples_[sample].position ==
-                     samples_[sample - 1].position + samples_[sample - 1].size);
-        *bytes = sum + wrongBytes;
+                 (samples_[sample].position == last.position ||
+                  samples_[sample].position == last.position + last.size));
+        *bytes = last.position + last.size - begin + wrongBytes;
         return NCF_OK;
     }
     NCFRESULT GetNumberOfContiguousEncodedUnits(ncfUInt32, ncfUInt64, ncfSInt64*) override {
@@ -176,6 +177,48 @@ TEST(SampleMap, IsNotDeceivedBySamplesThatOnlyBeginAndEndAlike) {
     EXPECT_EQ(runs.bytes, 17u);
     ASSERT_EQ(runs.runs.size(), 2u);
     EXPECT_EQ(runs.runs[0].count, 4u);
+    EXPECT_TRUE(runs.faults.empty());
+}
+
+// As of sound that is coded in blocks, counted frame by frame: the last block of a
+// run may hold fewer.
+TEST(SampleMap, CountsAPacketOfSeveralSamplesOnce) {
+    std::vector<Stored> samples;
+    for (ncfUInt32 i = 0; i < 10 * 1017 + 5; ++i) {
+        samples.push_back({36 + ncfUInt64{i / 1017} * 1024, 1024});
+    }
+    FakeMap one(samples);
+    RunMap runs = ReadRuns(one, 0, 36 + 11 * 1024);
+    ASSERT_EQ(runs.runs.size(), 1u);
+    EXPECT_EQ(runs.runs[0].count, samples.size());
+    EXPECT_EQ(runs.runs[0].bytes, 11u * 1024);
+    EXPECT_EQ(runs.bytes, 11u * 1024);
+    EXPECT_TRUE(runs.faults.empty());
+    EXPECT_LT(one.sizeQueries, 40u);
+    // A second run, in packets that hold fewer.
+    const std::size_t behind = samples.size();
+    for (ncfUInt32 i = 0; i < 30; ++i) {
+        samples.push_back({50000 + ncfUInt64{i / 7} * 1024, 1024});
+    }
+    FakeMap two(samples);
+    runs = ReadRuns(two, 0, 60000);
+    ASSERT_EQ(runs.runs.size(), 2u);
+    EXPECT_EQ(runs.runs[0].count, behind);
+    EXPECT_EQ(runs.runs[1].first, behind);
+    EXPECT_EQ(runs.runs[1].count, 30u);
+    EXPECT_EQ(runs.bytes, (11u + 5u) * 1024);
+    EXPECT_TRUE(runs.faults.empty());
+    EXPECT_EQ(ReadRuns(two, 0, 52000).faults.size(), 1u);
+}
+
+TEST(SampleMap, MeasuresARunWhosePacketsHoldDifferentNumbersOfSamples) {
+    FakeMap map({{0, 8}, {0, 8}, {0, 8}, {8, 8}, {16, 8}, {16, 8}, {100, 8}, {100, 8}});
+    const RunMap runs = ReadRuns(map, 0, 200);
+    ASSERT_EQ(runs.runs.size(), 2u);
+    EXPECT_EQ(runs.runs[0].count, 6u);
+    EXPECT_EQ(runs.runs[0].bytes, 24u);
+    EXPECT_EQ(runs.runs[1].count, 2u);
+    EXPECT_EQ(runs.bytes, 32u);
     EXPECT_TRUE(runs.faults.empty());
 }
 

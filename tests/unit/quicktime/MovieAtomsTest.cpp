@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <chrono>
 
 #include "reference_host/quicktime/MovieAtoms.h"
@@ -32,6 +33,54 @@ TEST(MovieAtoms, TellWhereTheDescriptionChanges) {
     ASSERT_EQ(atoms.tracks.size(), 1u);
     EXPECT_EQ(atoms.tracks[0].descriptionCount, 2u);
     EXPECT_EQ(atoms.tracks[0].descriptionChanges, (std::vector<ncfUInt64>{5, 12}));
+}
+
+movies::Bytes FloatSound(unsigned version) {
+    movies::SoundFormat format;
+    format.codec = "fpcm";
+    format.version = version;
+    format.extensions = {movies::Box("pcmC").Version(0).U8(1).U8(64)};
+    movies::Movie movie;
+    movie.tracks = {movies::SoundTrack(format, 10)};
+    return movies::Build(movie).ToBytes();
+}
+
+host::MovieAtoms::Track TrackOf(const movies::Bytes& bytes) {
+    const host::MovieAtoms atoms = host::ReadMovieAtoms(MadeMovie(bytes, ".mov").Path());
+    EXPECT_EQ(atoms.tracks.size(), 1u);
+    return atoms.tracks.empty() ? host::MovieAtoms::Track() : atoms.tracks[0];
+}
+
+TEST(MovieAtoms, TellTheLinearKindBehindTheFieldsOfEachVersion) {
+    for (const unsigned version : {0u, 1u, 2u}) {
+        const host::MovieAtoms::Track track = TrackOf(FloatSound(version));
+        EXPECT_EQ(track.linearBits, 64u) << version;
+        EXPECT_TRUE(track.isLittleEndian) << version;
+    }
+}
+
+TEST(MovieAtoms, TakeTheFieldsOfVersion1OutOfAListOfTheIsoForm) {
+    constexpr char kList[] = "stsd";
+    movies::Bytes bytes = FloatSound(0);
+    const auto list = std::search(bytes.begin(), bytes.end(), kList, kList + 4);
+    ASSERT_NE(list, bytes.end());
+    list[4] = 1;           // version of the list
+    list[12 + 8 + 9] = 1;  // of its one description
+    EXPECT_EQ(TrackOf(bytes).linearBits, 64u);
+}
+
+TEST(MovieAtoms, PassOverFieldsThatClaimMoreThanTheDescriptionHolds) {
+    constexpr char kList[] = "stsd";
+    for (const int claim : {0, 73, 0xFF}) {
+        movies::Bytes bytes = FloatSound(2);
+        const auto list = std::search(bytes.begin(), bytes.end(), kList, kList + 4);
+        ASSERT_NE(list, bytes.end());
+        const auto size = list + 12 + 36;
+        ASSERT_EQ(size[3], 72);
+        size[0] = claim == 0xFF ? 0xFF : 0;
+        size[3] = static_cast<std::uint8_t>(claim);
+        EXPECT_EQ(TrackOf(bytes).linearBits, claim == 0 ? 64u : 0u) << claim;
+    }
 }
 
 TEST(MovieAtoms, TellEditsOfEitherVersion) {
