@@ -124,10 +124,6 @@ void SoundDecoder::Rewind() {
     if (isRunning_) {
         input_ = std::move(again);
         UseOneStream(*input_, stream_);
-        // What a decoder carries on does not go with a flush.
-        if (auto codec = SoundCodec::Open(*input_->streams[stream_], false)) {
-            codec_ = std::move(codec);
-        }
     }
 }
 
@@ -151,7 +147,9 @@ bool SoundDecoder::SeekToKnown(ncfSInt64 place) {
 }
 
 void SoundDecoder::Start(ncfSInt64 place) {
-    codec_->Flush();
+    if (auto codec = SoundCodec::Open(*input_->streams[stream_], false)) {
+        codec_ = std::move(codec);
+    }
     converter_.Forget();
     isRunning_ = true;
     isFed_ = false;
