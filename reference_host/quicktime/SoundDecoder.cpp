@@ -30,6 +30,8 @@ bool LeansOnAllBefore(AVCodecID codec) {
         case AV_CODEC_ID_MACE3:
         case AV_CODEC_ID_MACE6:
         case AV_CODEC_ID_NELLYMOSER:
+        case AV_CODEC_ID_SPEEX:
+        case AV_CODEC_ID_G723_1:
             return true;
         default:
             return false;

@@ -8,15 +8,18 @@
 
 // A short movie to be made by FFmpeg.
 struct CodecCase {
-    std::string name;     // of the test
-    std::string source;   // what is encoded, as a filter graph
-    std::string options;  // of the encoder
-    std::string ending;   // of the file
+    std::string name;      // of the test
+    std::string source;    // what is encoded, as a filter graph
+    std::string options;   // of the encoder
+    std::string ending;    // of the file
+    bool isBrief = false;  // tested always
     // Copies the packets into a second movie, with these options before and
     // behind its input; not done when both are empty.
     std::string copyBefore;
     std::string copyBehind;
-    bool isBrief = false;  // tested always
+    std::string reading = {};  // options of ffmpeg's decoder
+    // See SoundCase.
+    bool isExactAnywhere = true;
 };
 
 inline std::ostream& operator<<(std::ostream& stream, const CodecCase& each) {
@@ -24,5 +27,5 @@ inline std::ostream& operator<<(std::ostream& stream, const CodecCase& each) {
 }
 
 // One for each combination of what a codec takes.
-std::vector<CodecCase> PictureCases();
-std::vector<CodecCase> SoundCases();
+std::vector<CodecCase> PictureCodecCases();
+std::vector<CodecCase> SoundCodecCases();

@@ -79,9 +79,18 @@ TEST_P(PictureCodecs, AreReadAsFfmpegReadsThem) {
     const auto movie = Make("0:v");
     ASSERT_FALSE(HasFailure());
     HoldDescription(movie);
-    cliphost::Essence essence(session(), movie);
-    Hold("map", [&] { return SampleMapDifferences(essence); });
-    Hold("pictures", [&] { return PictureDifferences(essence); });
+    const PlainPictures plain(movie);
+    {
+        cliphost::Essence essence(session(), movie);
+        Hold("map", [&] { return SampleMapDifferences(essence); });
+        Hold("pictures", [&] { return PictureDifferences(essence, plain); });
+    }
+    if (plain.form().hasAlpha) {
+        options.host.ignoreAlpha = false;
+        Start();
+        cliphost::Essence essence(session(), movie);
+        Hold("alpha", [&] { return AlphaDifferences(essence, plain); });
+    }
 }
 
 TEST_P(SoundCodecs, AreReadAsFfmpegReadsThem) {
@@ -90,8 +99,10 @@ TEST_P(SoundCodecs, AreReadAsFfmpegReadsThem) {
     HoldDescription(movie);
     cliphost::Essence essence(session(), movie);
     Hold("map", [&] { return SampleMapDifferences(essence); });
-    Hold("sound", [&] { return SoundDifferences(essence); });
-    Hold("ranges", [&] { return SoundRangeDifferences(essence); });
+    Hold("sound", [&] { return SoundDifferences(essence, GetParam().reading); });
+    if (GetParam().isExactAnywhere) {
+        Hold("ranges", [&] { return SoundRangeDifferences(essence); });
+    }
 }
 
 std::vector<CodecCase> Only(const std::vector<CodecCase>& cases, bool isBrief) {
@@ -108,12 +119,13 @@ std::string NameOf(const testing::TestParamInfo<CodecCase>& info) {
     return name;
 }
 
-INSTANTIATE_TEST_SUITE_P(Brief, PictureCodecs, testing::ValuesIn(Only(PictureCases(), true)),
+INSTANTIATE_TEST_SUITE_P(Brief, PictureCodecs, testing::ValuesIn(Only(PictureCodecCases(), true)),
                          NameOf);
-INSTANTIATE_TEST_SUITE_P(Thorough, PictureCodecs, testing::ValuesIn(Only(PictureCases(), false)),
+INSTANTIATE_TEST_SUITE_P(Thorough, PictureCodecs,
+                         testing::ValuesIn(Only(PictureCodecCases(), false)), NameOf);
+INSTANTIATE_TEST_SUITE_P(Brief, SoundCodecs, testing::ValuesIn(Only(SoundCodecCases(), true)),
                          NameOf);
-INSTANTIATE_TEST_SUITE_P(Brief, SoundCodecs, testing::ValuesIn(Only(SoundCases(), true)), NameOf);
-INSTANTIATE_TEST_SUITE_P(Thorough, SoundCodecs, testing::ValuesIn(Only(SoundCases(), false)),
+INSTANTIATE_TEST_SUITE_P(Thorough, SoundCodecs, testing::ValuesIn(Only(SoundCodecCases(), false)),
                          NameOf);
 
 }  // namespace

@@ -5,11 +5,12 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <array>
 #include <cmath>
 
 #include "reference_host/cliphost/FrameReader.h"
-#include "tests/system/codecs/PlainPicture.h"
+#include "tests/system/codecs/WantedPicture.h"
 
 namespace {
 
@@ -17,98 +18,32 @@ using cliphost::FrameReader;
 using cliphost::ImageFormat;
 using cliphost::PictureBytes;
 using Colours = PlainForm::Colours;
-using Pixel = std::array<double, 3>;
 
 constexpr double kRounded = 0.51;  // single precision
 constexpr double kBlended = 1.0 + 1e-3;
 // Three words, each rounded, and single precision between.
 constexpr double kThroughWords = 0.02;
 
-// The numbers of 8 bits that stand for black and white in the layouts of
-// Y'CbCr.
-double InVideoRange(const PlainForm& form, int component, double value) {
-    const double most = (1 << form.bits) - 1;
-    if (!form.isFullRange) {
-        return value / (1 << (form.bits - 8));
-    }
-    if (component == 0) {
-        return 16 + value / most * 219;
-    }
-    return 128 + (value - (1 << (form.bits - 1))) / most * 224;
-}
-
-// The pictures that a format should deliver.
-class Wanted {
-public:
-    explicit Wanted(const PlainPictures& plain) : plain_(plain) {}
-
-    double Luma(std::size_t frame, int x, int y) const {
-        return InVideoRange(plain_.form(), 0, plain_.At(frame, 0, x, y));
-    }
-    // At an even pixel of a line.
-    double Chroma(std::size_t frame, int component, int x, int y) const {
-        const PlainForm& form = plain_.form();
-        if (form.colours == Colours::Grey) {
-            return 128;
-        }
-        double sum = 0;
-        const Place line = LineOf(frame, y);
-        for (const auto& [row, share] :
-             {std::pair{line.first, 1 - line.share}, std::pair{line.second, line.share}}) {
-            sum += share * InLine(frame, component, x, row);
-        }
-        return InVideoRange(form, component, sum);
-    }
-    bool HasChromaThere() const {
-        return plain_.form().colours == Colours::Grey ||
-               (plain_.form().shiftX == 1 && plain_.form().shiftY == 0);
-    }
-    double Rgb(std::size_t frame, int component, int x, int y) const {
-        return plain_.At(frame, component, x, y) /
-               static_cast<double>((1 << plain_.form().bits) - 1);
-    }
-
-private:
-    struct Place {
-        int first;
-        int second;
-        double share;
-    };
-    // The two chroma lines about a line of the picture, in its own field.
-    Place LineOf(std::size_t frame, int y) const {
-        const int shift = plain_.form().shiftY;
-        if (shift == 0) {
-            return {y, y, 0};
-        }
-        const int step = 1 << shift;
-        const int lines = (static_cast<int>(plain_.height()) + step - 1) / step;
-        const auto held = [](int line, int count) { return std::clamp(line, 0, count - 1); };
-        const double between = plain_.HasChromaOnTop() ? 0 : 1;
-        if (!plain_.IsInterlaced(frame)) {
-            const double at = (y - between * (step - 1) / 2.0) / step;
-            const int above = static_cast<int>(std::floor(at));
-            return {held(above, lines), held(above + 1, lines), at - above};
-        }
-        const int field = y & 1;
-        const double at = ((y >> 1) - between * (field == 0 ? 0.25 : 0.75)) / step;
-        const int above = static_cast<int>(std::floor(at));
-        const int count = (lines + 1 - field) / 2;
-        return {held(above, count) * 2 + field, held(above + 1, count) * 2 + field, at - above};
-    }
-    double InLine(std::size_t frame, int component, int x, int row) const {
-        const auto at = [&](int column) { return plain_.At(frame, component, column, row); };
-        switch (plain_.form().shiftX) {
-            case 0:
-                return (at(x - 1) + 2 * at(x) + at(x + 1)) / 4.0;
-            case 1:
-                return at(x / 2);
-            default:
-                return (at(x / 4) + at(x % 4 == 0 ? x / 4 : x / 4 + 1)) / 2.0;
-        }
-    }
-
-    const PlainPictures& plain_;
+struct Weights {
+    const char* matrix;
+    double red;
+    double blue;
 };
+
+constexpr Weights kWeights[] = {
+    {"bt709", 0.2126, 0.0722},   {"bt470bg", 0.299, 0.114}, {"smpte170m", 0.299, 0.114},
+    {"smpte240m", 0.212, 0.087}, {"fcc", 0.30, 0.11},       {"bt2020nc", 0.2627, 0.0593},
+};
+
+// By the stream's word, else by the picture's size.
+Weights WeightsOf(const PlainPictures& plain) {
+    const auto* const found =
+        std::find_if(std::begin(kWeights), std::end(kWeights),
+                     [&plain](const Weights& weights) { return plain.matrix() == weights.matrix; });
+    return found != std::end(kWeights)                   ? *found
+           : plain.width() < 960 || plain.height() < 720 ? kWeights[1]
+                                                         : kWeights[0];
+}
 
 // The greatest difference of one kind of samples, and where it is.
 class Worst {
@@ -126,7 +61,7 @@ public:
     }
     void Tell(const std::string& format, std::vector<std::string>& differences) const {
         if (count_ > 0) {
-            differences.push_back(fmt::format("{}: {} of {} samples", format, text_, count_));
+            differences.push_back(fmt::format("{}: {}; {} samples differ", format, text_, count_));
         }
     }
 
@@ -144,6 +79,7 @@ public:
         : plain_(plain),
           reader_(reader),
           wanted_(plain),
+          weights_(WeightsOf(plain)),
           isExact_(plain.form().bits == 8 && !plain.form().isFullRange) {}
 
     void Run(const std::string& name, std::vector<std::string>& differences) {
@@ -167,7 +103,7 @@ public:
             }
             Compare(frame);
         }
-        for (const Worst* worst : {&luma_, &chroma_, &colour_, &words_}) {
+        for (const Worst* worst : {&luma_, &chroma_, &colour_, &words_, &alpha_}) {
             worst->Tell(name, differences);
         }
     }
@@ -182,100 +118,107 @@ private:
     }
 
     void ComparePixel(std::size_t frame, int x, int y) {
-        const bool isRgb = plain_.form().colours == Colours::Rgb;
+        const unsigned char* const bytes = reader_.bytes();
         switch (reader_.layout().bytes) {
-            case PictureBytes::CbYCrY8: {
-                const unsigned char* const pair = reader_.bytes() + PairAt(x, y);
-                luma_.Compare(pair[x % 2 == 0 ? 1 : 3], wanted_.Luma(frame, x, y), frame, x, y);
-                if (x % 2 == 0 && x + 1 < reader_.width()) {
-                    chroma_.Compare(pair[0], wanted_.Chroma(frame, 1, x, y), frame, x, y);
-                    chroma_.Compare(pair[2], wanted_.Chroma(frame, 2, x, y), frame, x, y);
-                }
+            case PictureBytes::CbYCrY8:
+                ComparePair(bytes + PairAt(x, y), frame, x, y);
                 break;
-            }
             case PictureBytes::Bgra8: {
-                const unsigned char* const pixel = reader_.bytes() + At(x, y) * 4;
+                const unsigned char* const pixel = bytes + At(x, y) * 4;
                 for (int c = 0; c < 3; ++c) {
                     colour_.Compare(pixel[2 - c], wanted_.Rgb(frame, c, x, y) * 255, frame, x, y);
                 }
-                colour_.Compare(pixel[3], 255, frame, x, y);
+                alpha_.Compare(pixel[3], 255, frame, x, y);
                 break;
             }
-            case PictureBytes::Argb16: {
-                const unsigned char* const pixel = reader_.bytes() + At(x, y) * 8;
-                Pixel words;
-                for (std::size_t c = 0; c < 3; ++c) {
-                    words[c] = pixel[2 * c + 2] << 8 | pixel[2 * c + 3];
-                }
-                colour_.Compare(pixel[0] << 8 | pixel[1], 65535, frame, x, y);
-                if (isRgb || plain_.form().colours == Colours::Grey) {
-                    for (int c = 0; c < 3; ++c) {
-                        colour_.Compare(words[static_cast<std::size_t>(c)],
-                                        4096 + wanted_.Rgb(frame, c, x, y) * 56064, frame, x, y);
-                    }
-                } else {
-                    CompareWords(words, frame, x, y);
-                }
+            case PictureBytes::Argb16:
+                CompareWords(bytes + At(x, y) * 8, frame, x, y);
                 break;
-            }
-            default:
-                break;  // bytes that are not what their label says
+            case PictureBytes::Alpha8:
+                alpha_.Compare(bytes[At(x, y)], wanted_.Alpha(frame, x, y) * 255, frame, x, y);
+                break;
+            case PictureBytes::Alpha10:
+                alpha_.Compare(bytes[At(x, y)] << 2 | bytes[Pixels() + At(x, y)],
+                               wanted_.Alpha(frame, x, y) * 1023, frame, x, y);
+                break;
+            case PictureBytes::Unusable:
+                break;
         }
     }
 
-    // Y'CbCr out of R'G'B' again, so that nothing hides in the matrix.
-    void CompareWords(const Pixel& words, std::size_t frame, int x, int y) {
-        for (const double word : words) {
-            if (word <= 0 || word >= 65535) {
-                return;  // cut off
+    // Of what is rounded, codes 0 and 255 are left to synchronisation.
+    void ComparePair(const unsigned char* pair, std::size_t frame, int x, int y) {
+        const auto held = [this](double value) {
+            return isExact_ ? value : std::clamp(value, 1.0, 254.0);
+        };
+        luma_.Compare(held(pair[x % 2 == 0 ? 1 : 3]), held(wanted_.Luma(frame, x, y)), frame, x, y);
+        if (x % 2 == 0 && x + 1 < reader_.width()) {
+            for (int c = 1; c <= 2; ++c) {
+                chroma_.Compare(held(pair[2 * c - 2]), held(wanted_.Chroma(frame, c, x, y)), frame,
+                                x, y);
             }
         }
-        const bool isSmall = reader_.width() < 960 || reader_.height() < 720;
-        const double red = isSmall ? 0.299 : 0.2126, blue = isSmall ? 0.114 : 0.0722;
-        const double r = (words[0] - 4096) / 56064, g = (words[1] - 4096) / 56064,
-                     b = (words[2] - 4096) / 56064;
+    }
+
+    void CompareWords(const unsigned char* pixel, std::size_t frame, int x, int y) {
+        std::array<double, 4> words;
+        for (std::size_t c = 0; c < 4; ++c) {
+            words[c] = pixel[2 * c] << 8 | pixel[2 * c + 1];
+        }
+        alpha_.Compare(words[0], 65535, frame, x, y);
+        if (plain_.form().colours != Colours::YCbCr) {
+            for (int c = 0; c < 3; ++c) {
+                colour_.Compare(words[static_cast<std::size_t>(c) + 1],
+                                4096 + wanted_.Rgb(frame, c, x, y) * 56064, frame, x, y);
+            }
+            return;
+        }
+        const bool isCutOff = std::any_of(words.begin() + 1, words.end(),
+                                          [](double word) { return word <= 0 || word >= 65535; });
+        if (isCutOff) {
+            return;
+        }
+        // Y'CbCr out of R'G'B' again, so that nothing hides in the matrix.
+        const double r = (words[1] - 4096) / 56064, g = (words[2] - 4096) / 56064,
+                     b = (words[3] - 4096) / 56064;
+        const double red = weights_.red, blue = weights_.blue;
         const double luma = red * r + (1 - red - blue) * g + blue * b;
         words_.Compare(16 + 219 * luma, wanted_.Luma(frame, x, y), frame, x, y);
-        const PlainForm& form = plain_.form();
-        if (form.shiftY == 0 && form.shiftX <= 1 && x % (1 << form.shiftX) == 0) {
-            const double cb = 128 + 112 * (b - luma) / (1 - blue);
-            const double cr = 128 + 112 * (r - luma) / (1 - red);
-            for (const auto& [component, got] : {std::pair{1, cb}, std::pair{2, cr}}) {
-                words_.Compare(
-                    got,
-                    InVideoRange(form, component, plain_.At(frame, component, x >> form.shiftX, y)),
-                    frame, x, y);
-            }
+        if (wanted_.HasStoredChroma(x)) {
+            words_.Compare(128 + 112 * (b - luma) / (1 - blue),
+                           wanted_.StoredChroma(frame, 1, x, y), frame, x, y);
+            words_.Compare(128 + 112 * (r - luma) / (1 - red), wanted_.StoredChroma(frame, 2, x, y),
+                           frame, x, y);
         }
     }
 
+    std::size_t Width() const { return static_cast<std::size_t>(reader_.width()); }
+    std::size_t Pixels() const { return Width() * static_cast<std::size_t>(reader_.height()); }
     std::size_t At(int x, int y) const {
-        return static_cast<std::size_t>(y) * static_cast<std::size_t>(reader_.width()) +
-               static_cast<std::size_t>(x);
+        return static_cast<std::size_t>(y) * Width() + static_cast<std::size_t>(x);
     }
     std::size_t PairAt(int x, int y) const {
-        return static_cast<std::size_t>(y) * static_cast<std::size_t>(reader_.width()) * 2 +
-               static_cast<std::size_t>(x / 2) * 4;
+        return static_cast<std::size_t>(y) * Width() * 2 + static_cast<std::size_t>(x / 2) * 4;
     }
 
     const PlainPictures& plain_;
     FrameReader& reader_;
-    const Wanted wanted_;
+    const WantedPicture wanted_;
+    const Weights weights_;
     const bool isExact_;
     Worst luma_{"luma", isExact_ ? 0 : kRounded};
     Worst chroma_{"chroma", !wanted_.HasChromaThere() ? kBlended : isExact_ ? 0 : kRounded};
     Worst colour_{"colour", plain_.form().isCoarse ? kBlended : kRounded};
     Worst words_{"Y'CbCr of the words", kThroughWords};
+    Worst alpha_{"alpha", kRounded};
 };
 
-}  // namespace
-
-std::vector<std::string> PictureDifferences(cliphost::Essence& essence) {
-    const cliphost::ClipTrack* const track = essence.First(cliphost::TrackKind::Picture);
+std::vector<std::string> Differences(cliphost::Essence& essence, cliphost::TrackKind kind,
+                                     const PlainPictures& plain) {
+    const cliphost::ClipTrack* const track = essence.First(kind);
     if (!track) {
-        return {"there is no picture track"};
+        return {fmt::format("there is no {} track", cliphost::NameOf(kind))};
     }
-    const PlainPictures plain(essence.movie());
     if (plain.form().name.empty()) {
         return {"there is no plain form of " + plain.decoded()};
     }
@@ -294,4 +237,15 @@ std::vector<std::string> PictureDifferences(cliphost::Essence& essence) {
         Comparison(plain, reader).Run(name, differences);
     }
     return differences;
+}
+
+}  // namespace
+
+std::vector<std::string> PictureDifferences(cliphost::Essence& essence,
+                                            const PlainPictures& plain) {
+    return Differences(essence, cliphost::TrackKind::Picture, plain);
+}
+
+std::vector<std::string> AlphaDifferences(cliphost::Essence& essence, const PlainPictures& plain) {
+    return Differences(essence, cliphost::TrackKind::Alpha, plain);
 }

@@ -54,7 +54,7 @@ void CompareRanges(SoundReader& reader, const EssenceBytes& all,
 
 }  // namespace
 
-std::vector<std::string> SoundDifferences(cliphost::Essence& essence) {
+std::vector<std::string> SoundDifferences(cliphost::Essence& essence, const std::string& reading) {
     const cliphost::ClipTrack* const track = essence.First(cliphost::TrackKind::Sound);
     if (!track) {
         return {"there is no sound track"};
@@ -62,7 +62,10 @@ std::vector<std::string> SoundDifferences(cliphost::Essence& essence) {
     SoundReader reader(essence, *track);
     std::vector<std::string> differences;
     const EssenceBytes got = ReadAll(reader, differences);
-    const EssenceBytes wanted = Decoded(essence.movie(), "-map 0:a:0 -f s24le -c:a pcm_s24le");
+    // What an edit leaves empty in front is silence, as in a player.
+    const EssenceBytes wanted = Decoded(
+        essence.movie(), "-map 0:a:0 -af aresample=async=1:first_pts=0 -f s24le -c:a pcm_s24le",
+        "-copyts " + reading);
     if (got.empty() || wanted.empty()) {
         return {fmt::format("{} bytes, ffmpeg gives {}", got.size(), wanted.size())};
     }
