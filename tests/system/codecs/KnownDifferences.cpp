@@ -18,18 +18,12 @@ constexpr const char* kNoAlpha =
 constexpr const char* kFault = "a fault, being mended";
 
 constexpr KnownDifference kKnown[] = {
-    {"avui_*", "alpha", kNoAlpha},
-    {"cfhd_*", "alpha", kNoAlpha},
-    {"dpx_*", "alpha", kNoAlpha},
-    {"exr_*", "alpha", kNoAlpha},
-    {"ffv1_*", "alpha", kNoAlpha},
-    {"ffvhuff_*", "alpha", kNoAlpha},
-    {"gif_*", "alpha", kNoAlpha},
-    {"jpeg2000_*", "alpha", kNoAlpha},
-    {"png_rgba64be_*", "alpha", kNoAlpha},
-    {"png_ya*", "alpha", kNoAlpha},
-    {"adpcm_ima_wav_*", "map", kFault},
-    {"adpcm_ms_*", "map", kFault},
+    {"avui_*", "alpha", kNoAlpha},         {"cfhd_*", "alpha", kNoAlpha},
+    {"dpx_*", "alpha", kNoAlpha},          {"exr_*", "alpha", kNoAlpha},
+    {"ffv1_*", "alpha", kNoAlpha},         {"ffvhuff_*", "alpha", kNoAlpha},
+    {"gif_*", "alpha", kNoAlpha},          {"jpeg2000_*", "alpha", kNoAlpha},
+    {"png_rgba64be_*", "alpha", kNoAlpha}, {"png_ya*", "alpha", kNoAlpha},
+    {"adpcm_ima_wav_*", "map", kFault},    {"adpcm_ms_*", "map", kFault},
     {"smc_*", "pictures", kFault},
 };
 
