@@ -30,6 +30,8 @@ bool LeansOnAllBefore(AVCodecID codec) {
         case AV_CODEC_ID_MACE3:
         case AV_CODEC_ID_MACE6:
         case AV_CODEC_ID_NELLYMOSER:
+        case AV_CODEC_ID_SPEEX:
+        case AV_CODEC_ID_G723_1:
             return true;
         default:
             return false;
@@ -155,10 +157,6 @@ void SoundDecoder::Rewind() {
     if (isRunning_) {
         input_ = std::move(again);
         UseOneStream(*input_, stream_);
-        // What a decoder carries on does not go with a flush.
-        if (auto codec = SoundCodec::Open(*input_->streams[stream_], false)) {
-            codec_ = std::move(codec);
-        }
     }
 }
 
@@ -182,7 +180,9 @@ bool SoundDecoder::SeekToKnown(ncfSInt64 place) {
 }
 
 void SoundDecoder::Start(ncfSInt64 place) {
-    codec_->Flush();
+    if (auto codec = SoundCodec::Open(*input_->streams[stream_], false)) {
+        codec_ = std::move(codec);
+    }
     converter_.Forget();
     isRunning_ = true;
     isFed_ = false;
