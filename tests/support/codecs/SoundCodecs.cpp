@@ -28,15 +28,15 @@ struct SoundCodec {
     bool isExactAnywhere = true;
 };
 
-// Left out is what ffmpeg writes but reads as something else: 64-bit integers, and
-// ADPCM of 96000 with blocks of another size than its sample table tells.
+// Left out is what ffmpeg writes but does not read as such: 64-bit integers, DFPWM,
+// and ADPCM at 96000, whose blocks have another size than its sample table tells.
 constexpr SoundCodec kCodecs[] = {
     {"aac", "-c:a aac -aac_pns 0", "mov mp4 m4a"},
     {"aac_noise", "-c:a aac -b:a 48k", "mov", "48000", "stereo", "", false},
     {"ac3", "-c:a ac3", "mov mp4", kBroadcastRates, kAllLayouts, kOwnNoise},
     {"ac3_fixed", "-c:a ac3_fixed", "mov mp4", kBroadcastRates, kAllLayouts, kOwnNoise},
-    {"adpcm_g722", "-c:a g722", "mov", "16000", "mono"},
-    {"adpcm_g726", "-c:a g726", "mov", "8000", "mono"},
+    {"adpcm_g722", "-c:a g722", "mov", "16000 48000 44100", "mono"},
+    {"adpcm_g726", "-c:a g726 -strict -2", "mov", "8000 48000 44100", "mono"},
     {"adpcm_ima_qt", "-c:a adpcm_ima_qt", "mov", kAllRates, "stereo mono"},
     {"adpcm_ima_wav", "-c:a adpcm_ima_wav", "mov", kMpegRates, "stereo mono"},
     {"adpcm_ms", "-c:a adpcm_ms", "mov", kMpegRates, "stereo mono"},
