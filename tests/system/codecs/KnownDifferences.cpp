@@ -15,7 +15,6 @@ struct KnownDifference {
 
 constexpr const char* kNoAlpha =
     "ffmpeg writes a depth without alpha into the header, and a clip shows alpha where it is told";
-constexpr const char* kFault = "a fault, being mended";
 
 constexpr KnownDifference kKnown[] = {
     {"avui_*", "alpha", kNoAlpha},
@@ -39,10 +38,6 @@ constexpr KnownDifference kKnown[] = {
     {"tiff_*", "alpha", kNoAlpha},
     {"magicyuv_gray_*", "pictures",
      "the decoder marks its frames as of video range; ffprobe does not tell it of the stream"},
-    {"qtrle_gray_*", "pictures", kFault},
-    {"adpcm_ima_wav_*", "map", kFault},
-    {"adpcm_ms_*", "map", kFault},
-    {"smc_*", "pictures", kFault},
 };
 
 }  // namespace
