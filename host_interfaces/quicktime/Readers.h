@@ -44,7 +44,8 @@ constexpr const GUID& ncfIdOf(const IQTVideoReader*) {
     return IID_IQTVideoReader;
 }
 
-// Delivers interleaved sound of any audio track, never resampled.
+// Delivers interleaved sound of any audio track, at the rate of its beginning: sound
+// that changes its rate or channels on the way is converted, nothing else is.
 struct IQTAudioReader : INCFUnknown {
     virtual NCFRESULT ReservedAudioReaderOperation() = 0;  // 3
     // 4. Form of the sound of one track; the channel count is written back.

@@ -15,20 +15,6 @@ namespace {
 
 using host::DisplayPath;
 
-// Asks the mapping for another interface. A failed preparation leaves a pointer
-// behind that is the asker's to release.
-template <class Interface>
-NCFRESULT Ask(NMA::ISampleMapping* map, host::Ref<Interface>& out) {
-    void* found = nullptr;
-    const NCFRESULT result =
-        map->QueryInterface(ncfIdOf(static_cast<const Interface*>(nullptr)), &found);
-    out = host::Ref<Interface>::Adopt(static_cast<Interface*>(found));
-    if (result < 0) {
-        out.Reset();
-    }
-    return result;
-}
-
 }  // namespace
 
 Essence::Essence(Session& session, std::filesystem::path movie, const ParameterOptions& parameters)
@@ -49,7 +35,7 @@ Essence::Essence(Session& session, std::filesystem::path movie, const ParameterO
 // The description says better what is wrong with a file, where it failed too.
 void Essence::Map(NMA::IMediaContainer3& container) {
     const NCFRESULT mapped = container.GetSampleMapping(map_.Out());
-    const NCFRESULT provided = mapped < 0 ? mapped : Ask(map_.get(), provider_);
+    const NCFRESULT provided = mapped < 0 ? mapped : host::Query(map_.get(), provider_);
     if (provided < 0) {
         throw Failure(undescribed_ ? undescribed_ : ProblemWith(session_, movie_, provided));
     }
@@ -59,8 +45,8 @@ void Essence::Map(NMA::IMediaContainer3& container) {
 // takes their numbers.
 std::vector<ClipTrack> Essence::FindTracks() {
     std::vector<ClipTrack> tracks;
-    Ask(map_.get(), pictures_);
-    Ask(map_.get(), sounds_);
+    host::Query(map_.get(), pictures_);
+    host::Query(map_.get(), sounds_);
     for (;;) {
         ClipTrack track;
         track.number = static_cast<ncfUInt32>(tracks.size());
@@ -89,7 +75,7 @@ std::vector<ClipTrack> Essence::FindTracks() {
 
 NMA::IUncompressedImageProvider& Essence::pictures() {
     if (!pictures_) {
-        const NCFRESULT result = Ask(map_.get(), pictures_);
+        const NCFRESULT result = host::Query(map_.get(), pictures_);
         if (result < 0) {
             Fail("no picture formats", result);
         }
@@ -99,7 +85,7 @@ NMA::IUncompressedImageProvider& Essence::pictures() {
 
 NMA::IUncompressedAudioProvider& Essence::sounds() {
     if (!sounds_) {
-        const NCFRESULT result = Ask(map_.get(), sounds_);
+        const NCFRESULT result = host::Query(map_.get(), sounds_);
         if (result < 0) {
             Fail("no sound reader", result);
         }
