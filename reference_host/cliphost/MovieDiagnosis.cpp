@@ -40,20 +40,6 @@ const std::vector<ncfUInt32>& TracksOf(const HeaderReport& header, TrackKind kin
                                                      : header_parser::TrackKind::kVideo);
 }
 
-// Why the module takes no clip from a header that the parser understands.
-std::string WhyOfNoUse(const HeaderReport& header) {
-    const std::vector<ncfUInt32>& pictures = TracksOf(header, TrackKind::Picture);
-    if (pictures.empty() && TracksOf(header, TrackKind::Sound).empty()) {
-        return fmt::format("the movie holds no picture and no sound in its {}",
-                           Counted(header.movie->tracks.size(), "track"));
-    }
-    if (!pictures.empty() && header.movie->tracks[pictures.front()].descriptionCount == 0) {
-        return fmt::format("track {} of the file: 'stsd' describes none of its samples",
-                           pictures.front() + 1);
-    }
-    return {};
-}
-
 // How often the pictures of the first track follow each other.
 std::string RateWords(const HeaderReport& header) {
     const ncfUInt32 place = TracksOf(header, TrackKind::Picture).front();
@@ -181,7 +167,7 @@ Problem OfSecondRoute(const std::filesystem::path& movie, const std::string& ref
 }
 
 RouteTaken RouteOf(const HeaderReport& header) {
-    const std::string refused = header.movie ? WhyOfNoUse(header) : header.refusal.Sentence();
+    const std::string refused = header.WhyOfNoUse();
     return {refused.empty() ? route::kHeader : route::kLibrary, refused};
 }
 
@@ -250,8 +236,11 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
                            "only who holds the key can read them");
         }
     }
+    // Tracks of a header that is read are those of the library, place by place.
     const std::string decoder =
-        host::DecoderProblem(movie, which.kind == TrackKind::Sound, which.place);
+        track && taken.reason.empty()
+            ? host::DecoderProblem(movie, number)
+            : host::DecoderProblem(movie, which.kind == TrackKind::Sound, which.place);
     if (!decoder.empty()) {
         return because(decoder, "convert it with a program that knows this codec");
     }

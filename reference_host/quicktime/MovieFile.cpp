@@ -9,12 +9,11 @@ extern "C" {
 }
 
 #include <algorithm>
-#include <fstream>
 #include <iterator>
 #include <limits>
 #include <set>
 
-#include "reference_host/header_parser/QTParser.h"
+#include "reference_host/header_parser/InspectHeaders.h"
 #include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/PacketList.h"
 
@@ -79,18 +78,6 @@ ncfUInt32 Lowest(const std::vector<ncfUInt32>& tracks) {
     return tracks.empty() ? 0 : *std::min_element(tracks.begin(), tracks.end());
 }
 
-// Whether the header parser takes the movie.
-bool HeaderIsRead(const std::filesystem::path& path) {
-    std::ifstream stream(path, std::ios::binary);
-    const auto readAt = [&stream](ncfUInt64 position, ncfUInt8* to, ncfUInt32 wanted) {
-        stream.clear();
-        stream.seekg(static_cast<std::streamoff>(position));
-        stream.read(reinterpret_cast<char*>(to), wanted);
-        return static_cast<ncfUInt32>(stream.gcount());
-    };
-    return header_parser::ReadHeaders(*MakeRef<header_parser::QTParser>(), readAt) >= 0;
-}
-
 }  // namespace
 
 std::unique_ptr<MovieFile> MovieFile::Open(const std::filesystem::path& path, std::string& reason) {
@@ -104,9 +91,7 @@ MovieFile::MovieFile(std::filesystem::path path, InputOwner input)
         atoms_ = ReadMovieAtoms(path_);
     }
     NumberTracks();
-    const std::vector<ncfUInt32> pictures = TracksWhere(&MovieFile::IsVideo);
-    countsAsInFile_ =
-        !std::is_sorted(pictures.begin(), pictures.end()) && IndexIsWhole() && HeaderIsRead(path_);
+    firstVideo_ = ChooseFirstVideo();
     const bool isByContainer = !HasStreamDetails(*input_);
     for (unsigned i = 0; i < input_->nb_streams; ++i) {
         const AVStream& stream = *input_->streams[i];
@@ -209,9 +194,23 @@ std::vector<ncfUInt32> MovieFile::TracksWhere(bool (MovieFile::*test)(ncfUInt32)
     return tracks;
 }
 
-ncfUInt32 MovieFile::FirstVideo() const {
-    const std::vector<ncfUInt32> tracks = TracksWhere(&MovieFile::IsVideo);
-    return countsAsInFile_ ? tracks.front() : Lowest(tracks);
+// Which of several the header shows is asked of its parser: handlers tell it the
+// kinds of tracks, and codes tell the library.
+ncfUInt32 MovieFile::ChooseFirstVideo() const {
+    const std::vector<ncfUInt32> pictures = TracksWhere(&MovieFile::IsVideo);
+    if (pictures.size() > 1 && IndexIsWhole()) {
+        const header_parser::HeaderReport header = header_parser::InspectHeaders(path_);
+        if (const auto place = header.ShownTrack()) {
+            const ncfUInt32 id = header.movie->tracks[*place].id;
+            const int stream = *place < input_->nb_streams && IdOf(*place) == id
+                                   ? static_cast<int>(*place)
+                                   : StreamOf(id);
+            if (stream >= 0 && IsVideo(numbers_[static_cast<std::size_t>(stream)])) {
+                return numbers_[static_cast<std::size_t>(stream)];
+            }
+        }
+    }
+    return Lowest(pictures);
 }
 
 ncfUInt32 MovieFile::FirstAudio() const {

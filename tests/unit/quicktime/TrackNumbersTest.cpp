@@ -211,6 +211,54 @@ TEST(FirstPictureTrack, IsThatOfTheLowestNumberWhereTheHeaderIsRefused) {
     EXPECT_EQ(count, 3u);
 }
 
+// Chapters of a sound are pictures as well, whoever names them.
+TEST(FirstPictureTrack, MayBeTheChaptersOfAnother) {
+    for (const std::size_t by : {0u, 1u}) {
+        movies::Movie movie = TwoPictures(1, 2);
+        movie.tracks[by].inTrack = {movies::Box("tref").Add(movies::Box("chap").U32(1))};
+        const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+        const Wrapper wrapper = OpenWrapper(file.Path());
+        ASSERT_TRUE(wrapper);
+        EXPECT_EQ(Kinds(wrapper), "-vv") << by;
+        ncfUInt32 track = 0;
+        ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1);
+        EXPECT_EQ(track, 1u) << by;
+    }
+}
+
+// The handler tells the header's readers the kind of a track, its code tells
+// the multimedia library.
+TEST(FirstPictureTrack, HasTheHandlerOfPictures) {
+    for (const char* const handler : {"pict", "text", "meta", "tmcd", "hint", "gnrc", "m1v "}) {
+        movies::Movie movie = TwoPictures(1, 2);
+        movie.tracks[0].handler = handler;
+        const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+        const Wrapper wrapper = OpenWrapper(file.Path());
+        ASSERT_TRUE(wrapper) << handler;
+        ncfUInt32 track = 0;
+        ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1) << handler;
+        EXPECT_EQ(track, 2u) << handler;
+    }
+}
+
+// The parser takes this header, but a picture without a size makes no clip.
+TEST(FirstPictureTrack, IsThatOfTheLowestNumberWhereNoClipIsMadeOfTheHeader) {
+    for (const auto& [first, second] : {std::pair(9u, 3u), std::pair(3u, 9u)}) {
+        movies::Movie movie = TwoPictures(first, second);
+        movies::VideoFormat format;
+        format.codec = "raw ";
+        format.width = 0;
+        format.height = 8;
+        movie.tracks[0].descriptions = {format.ToBox()};
+        const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+        const Wrapper wrapper = OpenWrapper(file.Path());
+        ASSERT_TRUE(wrapper);
+        ncfUInt32 track = 0;
+        ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1);
+        EXPECT_EQ(track, 3u);
+    }
+}
+
 // As with a header that is read: what samples last counts, give or take one.
 TEST(TrackDescriptions, TellTheRateOfTheSamplesWhateverTheHeaderSays) {
     for (const std::uint64_t told : {10u, 28u, 30u, 300u}) {
