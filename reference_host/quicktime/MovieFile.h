@@ -82,6 +82,7 @@ private:
     ncfUInt32 IdOf(unsigned stream) const;  // 0 for none
     bool NeedsPacketTimes() const;
     bool MayHoldFieldsApart(int stream) const;
+    std::optional<double> RateOfTable(int stream) const;
     double MeanRateOfMedia(int stream) const;
     double MeanRateOfPackets(int stream);
     double SecondsOfPackets(int stream);
