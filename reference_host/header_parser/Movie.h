@@ -28,6 +28,7 @@ struct Track {
     std::array<float, 9> matrix{};
     ncfUInt32 mediaTimeScale = 0;
     ncfUInt32 mediaDuration = 0;
+    ncfUInt32 toldMediaDuration = 0;  // by its header; 0 for nothing
     EditList edits;
     SampleTable samples;
 

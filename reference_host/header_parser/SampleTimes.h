@@ -39,6 +39,9 @@ public:
     }
     ncfUInt64 MeanDuration() const { return sampleCount_ == 0 ? 0 : total_ / sampleCount_; }
 
+    // The first of the samples that last longest. There must be one.
+    ncfUInt32 LongestSample() const;
+
     // The sample on show at that time of the shifted display axis; false
     // behind the end.
     bool SampleShownAt(ncfUInt64 time, ncfUInt32& sample) const;

@@ -297,6 +297,7 @@ Verdict SetDurations(std::optional<ncfUInt64> header, std::optional<ncfUInt64> m
             bounded == duration ? *media : MultiplyDivide(bounded, scales.media, scales.movie);
     }
     track.isShorterThanTold = bounded < duration;
+    track.toldMediaDuration = static_cast<ncfUInt32>(media.value_or(0));
     track.mediaDuration = static_cast<ncfUInt32>(mediaDuration);
     track.duration = static_cast<ncfUInt32>(bounded);
     return Fine();

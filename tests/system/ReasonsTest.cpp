@@ -125,6 +125,51 @@ INSTANTIATE_TEST_SUITE_P(
         Case{"LongPictures", TwoLongPictures, "describe -q",
              "cliphost: a.mov: track 1 of the file: 2 pictures in 7200 seconds come to no rate of "
              "frames; the sound alone can be had: cliphost audio FILE --rate 48000 -o FILE.wav"},
+        Case{"OneEndlessPicture",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 29, 30, 1));
+                 movie.tracks[0].samples.push_back({1, 1000, 0x7FFFFFFF});
+                 movie.tracks[0].mediaDuration = 30;
+                 movie.tracks[0].trackDuration = 600;
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1 of the file: 30 pictures in 71582789 seconds come to no "
+             "rate of frames: sample 29 of its table alone lasts 71582788 seconds, 'mdhd' tells 1 "
+             "second of all"},
+        Case{"NoTimes",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 0));
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1 of the file: neither its samples nor its headers tell how "
+             "long it lasts"},
+        Case{"NoTimesBesideARefusal",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 1));
+                 movie.tracks[0].replaced = {movies::Box("stts").Version(0).U32(0)};
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1: 'stts' counts 0 samples, the track has 30 (at byte 490); "
+             "what the multimedia library reads makes no description either; -vv shows what it "
+             "logs"},
+        Case{"EditsThatShowNothing",
+             [] {
+                 movies::Movie movie = movies::Movie();
+                 movies::VideoFormat format;
+                 format.codec = "raw ";
+                 format.width = format.height = 8;
+                 movie.tracks = {movies::VideoTrack(format, 30, 30, 1, 192)};
+                 movie.tracks[0].edits = {{600, -1, 1.0}};
+                 return movies::Build(movie).ToBytes();
+             },
+             "frame -o o.png",
+             "cliphost: a.mov: track 1 of the file: its edits show none of its 30 samples"},
         Case{"EncryptedPicture", [] { return WithCode(Made("png.mov"), "png ", "encv"); },
              "frame -o o.png",
              "cliphost: a.mov: track 1 of the file: its samples are encrypted "
