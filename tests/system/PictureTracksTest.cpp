@@ -32,9 +32,9 @@ movies::Box ChaptersIn(std::uint32_t track) {
     return movies::Box("tref").Add(movies::Box("chap").U32(track));
 }
 
-movies::VideoFormat Picture(unsigned width) {
+movies::VideoFormat Picture(unsigned width, const char* codec = "raw ") {
     movies::VideoFormat format;
-    format.codec = "raw ";
+    format.codec = codec;
     format.width = width;
     format.height = 8;
     return format;
@@ -93,9 +93,17 @@ INSTANTIATE_TEST_SUITE_P(
         Case{"ChaptersOfItself",
              [](movies::Movie& movie) { movie.tracks[0].inTrack = {ChaptersIn(1)}; }, 0},
         Case{"BesideAPictureOfAnotherHandler",
-             [](movies::Movie& movie) { movie.tracks[0].handler = "pict"; }, 1},
+             [](movies::Movie& movie) {
+                 movie.tracks[0].handler = "pict";
+                 movie.tracks[0].descriptions = {Picture(16, "jpeg").ToBox()};
+             },
+             1},
         Case{"BesideAPictureCalledText",
-             [](movies::Movie& movie) { movie.tracks[0].handler = "text"; }, 1},
+             [](movies::Movie& movie) {
+                 movie.tracks[0].handler = "text";
+                 movie.tracks[0].descriptions = {Picture(16, "jpeg").ToBox()};
+             },
+             1},
         // The header is read, but no clip is made of it.
         Case{"BesideOneWithoutSize",
              [](movies::Movie& movie) {

@@ -132,6 +132,21 @@ TEST(Track, OfPlainSoundIsAsLongAsItsHeadersAgree) {
     }
 }
 
+// What the track tells in units of the movie is half a sample of the media off at
+// most: 31 of 600 a second are 2278.5 of 44100.
+TEST(Track, OfPlainSoundAgreesToTheNearestSample) {
+    for (const auto& [media, expected] :
+         {std::pair(2277u, 4410u), {2278u, 2278u}, {2279u, 2279u}, {2280u, 4410u}}) {
+        movies::SoundFormat format;
+        format.rate = 44100;
+        Movie movie;
+        movie.tracks = {movies::SoundTrack(format, 4410)};
+        movie.tracks[0].mediaDuration = media;
+        movie.tracks[0].trackDuration = 31;
+        EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), expected);
+    }
+}
+
 // An edit counts for more than the track's header.
 TEST(Track, OfPlainSoundAgreesWithItsEditsFirst) {
     Movie movie;
