@@ -272,6 +272,9 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
         return Problem{movie, std::move(reason), std::move(hint), NCF_OK, taken.route};
     };
     const auto [track, number] = Find(header, which);
+    if (track && track->samples.Count() == 0) {
+        return because(fmt::format("track {} of the file: it holds no samples", number + 1), {});
+    }
     if (track) {
         const ncfUInt32 codec = !track->video.empty()   ? track->video.front().codec
                                 : !track->sound.empty() ? track->sound.front().codec

@@ -170,6 +170,16 @@ INSTANTIATE_TEST_SUITE_P(
              },
              "frame -o o.png",
              "cliphost: a.mov: track 1 of the file: its edits show none of its 30 samples"},
+        Case{"SoundWithoutSamples",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 1));
+                 movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 0));
+                 movie.tracks[1].mediaDuration = 48000;
+                 movie.tracks[1].trackDuration = 600;
+                 return movies::Build(movie).ToBytes();
+             },
+             "audio -o o.wav", "cliphost: a.mov: track 2 of the file: it holds no samples"},
         Case{"EncryptedPicture", [] { return WithCode(Made("png.mov"), "png ", "encv"); },
              "frame -o o.png",
              "cliphost: a.mov: track 1 of the file: its samples are encrypted "
@@ -299,6 +309,32 @@ TEST_F(Reasons, TellWhyAMovieIsReadTheSecondWay) {
     const Json& other = parsed.is_array() ? parsed[0] : parsed;
     EXPECT_EQ(other["route"], "header");
     EXPECT_FALSE(other.contains("routeReason"));
+}
+
+// The parser takes the header; the module makes no clip of a picture without size.
+TEST_F(Reasons, TellThatNoClipIsMadeOfAHeaderThatIsRead) {
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=64x48 -frames:v 1 " +
+                         In("a.jpg"))
+                  .status,
+              0);
+    const movies::Bytes picture = ReadFile(folder() / "a.jpg");
+    movies::VideoFormat format;
+    format.codec = "jpeg";
+    format.width = 0;
+    format.height = 48;
+    movies::Movie movie =
+        OneTrack(movies::VideoTrack(format, 2, 25, 1, static_cast<std::uint32_t>(picture.size())));
+    for (int i = 0; i < 2; ++i) {
+        movies::Bytes& data = movie.tracks[0].data;
+        data.insert(data.end(), picture.begin(), picture.end());
+    }
+    const CommandResult json =
+        RunCommand(Quoted(ProgramFolder() / "cliphost") + " describe --json " +
+                   Quoted(Write(movie)) + " 2>/dev/null");
+    const Json entry = Json::parse(json.out);
+    const Json& one = entry.is_array() ? entry[0] : entry;
+    EXPECT_EQ(one["route"], "library");
+    EXPECT_EQ(one["routeReason"], "track 1 of the file: 'jpeg' tells a size of 0 x 48");
 }
 
 }  // namespace
