@@ -185,7 +185,8 @@ Problem Essence::WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESU
     problem.subject = movie_;
     problem.code = result;
     if (!problem) {
-        problem.reason = "it can't be decoded";
+        problem.reason =
+            result == NMA_E_NODATA ? WhyNotShown(movie_, Which(track)) : "it can't be decoded";
     }
     return problem;
 }

@@ -73,12 +73,13 @@ void FrameReader::Choose(const std::string& formatName) {
                   "it offers " + offered);
 }
 
+// Edits may show pictures twice, so only where there is one does the number of
+// samples end them: it is given for every frame that is asked for.
 std::uint64_t FrameReader::MostFrames() const {
     ncfUInt64 samples = 0;
-    if (essence_.map().GetNumberOfSamples(track_.number, &samples) < 0) {
-        samples = track_.length;
-    }
-    return std::min<std::uint64_t>(track_.length, samples);
+    const bool isOne =
+        essence_.map().GetNumberOfSamples(track_.number, &samples) >= 0 && samples <= 1;
+    return isOne ? std::min<std::uint64_t>(track_.length, samples) : track_.length;
 }
 
 std::uint64_t FrameReader::Count() {
@@ -94,6 +95,9 @@ std::uint64_t FrameReader::Count() {
             const std::uint64_t middle = there + (count - there) / 2;
             (Read(middle) == NMA_E_NODATA ? count : there) = middle;
         }
+    }
+    if (count == 1 && Read(0) == NMA_E_NODATA) {
+        count = 0;
     }
     count_ = count;
     return count;

@@ -29,6 +29,7 @@ constexpr const char* kNoLength = "The length of the movie can't be determined."
 constexpr const char* kNoTracks = "Movie doesn't contain any video/audio tracks!";
 
 constexpr const char* kCopyAgain = "copy the file again from where it came";
+constexpr const char* kConvert = "convert it with a program that knows this codec";
 
 constexpr ncfUInt32 kEncrypted[] = {Code("encv"), Code("enca"), Code("drmi"), Code("drms")};
 
@@ -41,29 +42,31 @@ const std::vector<ncfUInt32>& TracksOf(const HeaderReport& header, TrackKind kin
                                                      : header_parser::TrackKind::kVideo);
 }
 
-// Why the module takes no clip from a header that the parser understands.
-std::string WhyOfNoUse(const HeaderReport& header) {
-    const std::vector<ncfUInt32>& pictures = TracksOf(header, TrackKind::Picture);
-    if (pictures.empty() && TracksOf(header, TrackKind::Sound).empty()) {
-        return fmt::format("the movie holds no picture and no sound in its {}",
-                           Counted(header.movie->tracks.size(), "track"));
-    }
-    if (!pictures.empty() && header.movie->tracks[pictures.front()].descriptionCount == 0) {
-        return fmt::format("track {} of the file: 'stsd' describes none of its samples",
-                           pictures.front() + 1);
-    }
-    return {};
+std::string SecondsWords(ncfUInt64 units, const Track& track) {
+    const ncfUInt64 seconds = (units + track.mediaTimeScale / 2) / track.mediaTimeScale;
+    return Counted(seconds, "second");
 }
 
-// How often the pictures of the first track follow each other.
+// How often the pictures of the first track follow each other, and what makes
+// that no rate where it is a single one.
 std::string RateWords(const HeaderReport& header) {
     const ncfUInt32 place = TracksOf(header, TrackKind::Picture).front();
     const Track& track = header.movie->tracks[place];
-    const double seconds = track.mediaTimeScale == 0
-                               ? 0
-                               : static_cast<double>(track.mediaDuration) / track.mediaTimeScale;
-    return fmt::format("track {} of the file: {} in {:.0f} seconds come to no rate of frames",
-                       place + 1, Counted(track.samples.Count(), "picture"), seconds);
+    const header_parser::SampleTimes& times = track.samples.Times();
+    const std::string words = fmt::format(
+        "track {} of the file: {} in {} come to no rate of frames", place + 1,
+        Counted(track.samples.Count(), "picture"), SecondsWords(track.mediaDuration, track));
+    if (track.samples.Count() < 2) {
+        return words;
+    }
+    const ncfUInt32 sample = times.LongestSample();
+    const ncfUInt32 longest = times.DurationOf(sample);
+    if (longest <= times.TotalDuration() - longest || track.toldMediaDuration >= longest) {
+        return words;
+    }
+    return fmt::format("{}: sample {} of its table alone lasts {}, 'mdhd' tells {} of all", words,
+                       sample, SecondsWords(longest, track),
+                       SecondsWords(track.toldMediaDuration, track));
 }
 
 // How the sound of a movie without description is had.
@@ -113,8 +116,22 @@ std::string WhatIsEmpty(const HeaderReport& header) {
     return {};
 }
 
+// Whether nothing tells how long the picture that a clip shows lasts.
+std::string WhatIsUntimed(const HeaderReport& header) {
+    const auto place = header.ShownTrack();
+    return place && header.movie->tracks[*place].duration == 0
+               ? fmt::format(
+                     "track {} of the file: neither its samples nor its headers tell how "
+                     "long it lasts",
+                     *place + 1)
+               : std::string();
+}
+
 Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& header,
                      const std::vector<std::string>& notices) {
+    if (const std::string empty = WhatIsEmpty(header); !empty.empty()) {
+        return {movie, empty};
+    }
     if (HasSaid(notices, kNoRate)) {
         return WithoutRate(movie, header);
     }
@@ -124,14 +141,19 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
                             Counted(header.movie->duration, "unit"), header.movie->timeScale),
                 SoundHint(header)};
     }
-    if (const std::string empty = WhatIsEmpty(header); !empty.empty()) {
-        return {movie, empty};
-    }
     if (const std::string missing = WhatAnyTrackMisses(header); !missing.empty()) {
         return {movie, missing, kCopyAgain};
     }
     if (const std::string opening = host::OpenProblem(movie); !opening.empty()) {
         return {movie, "the multimedia library, which decodes it, refuses it: " + opening};
+    }
+    if (const std::string untimed = WhatIsUntimed(header); !untimed.empty()) {
+        return {movie, untimed};
+    }
+    for (const ncfUInt32 sound : TracksOf(header, TrackKind::Sound)) {
+        if (const std::string decoder = host::DecoderProblem(movie, sound); !decoder.empty()) {
+            return {movie, decoder, kConvert};
+        }
     }
     return {};
 }
@@ -148,8 +170,22 @@ Problem OfSecondRoute(const std::filesystem::path& movie, const std::string& ref
     return {movie, fmt::format("{}; read by the multimedia library, {}", refusal, found)};
 }
 
+// A track of a header that is understood, with its place in the file.
+struct Found {
+    const Track* track = nullptr;
+    std::size_t place = 0;
+};
+
+Found Find(const HeaderReport& header, const WhichTrack& which) {
+    if (!header.movie || which.place >= TracksOf(header, which.kind).size()) {
+        return {};
+    }
+    const std::size_t place = TracksOf(header, which.kind)[which.place];
+    return {&header.movie->tracks[place], place};
+}
+
 RouteTaken RouteOf(const HeaderReport& header) {
-    const std::string refused = header.movie ? WhyOfNoUse(header) : header.refusal.Sentence();
+    const std::string refused = header.WhyOfNoUse();
     return {refused.empty() ? route::kHeader : route::kLibrary, refused};
 }
 
@@ -203,11 +239,11 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
     const auto because = [&](std::string reason, std::string hint) {
         return Problem{movie, std::move(reason), std::move(hint), NCF_OK, taken.route};
     };
-    const Track* track = nullptr;
-    std::size_t number = 0;
-    if (header.movie && which.place < TracksOf(header, which.kind).size()) {
-        number = TracksOf(header, which.kind)[which.place];
-        track = &header.movie->tracks[number];
+    const auto [track, number] = Find(header, which);
+    if (track && track->samples.Count() == 0) {
+        return because(fmt::format("track {} of the file: it holds no samples", number + 1), {});
+    }
+    if (track) {
         const ncfUInt32 codec = !track->video.empty()   ? track->video.front().codec
                                 : !track->sound.empty() ? track->sound.front().codec
                                                         : 0;
@@ -218,10 +254,13 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
                            "only who holds the key can read them");
         }
     }
+    // Tracks of a header that is read are those of the library, place by place.
     const std::string decoder =
-        host::DecoderProblem(movie, which.kind == TrackKind::Sound, which.place);
+        track && taken.reason.empty()
+            ? host::DecoderProblem(movie, number)
+            : host::DecoderProblem(movie, which.kind == TrackKind::Sound, which.place);
     if (!decoder.empty()) {
-        return because(decoder, "convert it with a program that knows this codec");
+        return because(decoder, kConvert);
     }
     if (which.kind != TrackKind::Sound) {
         if (const std::string raster = host::RasterProblem(movie); !raster.empty()) {
@@ -234,6 +273,20 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
         }
     }
     return {};
+}
+
+std::string WhyNotShown(const std::filesystem::path& movie, const WhichTrack& which) {
+    const HeaderReport header = header_parser::InspectHeaders(movie);
+    const Found found = Find(header, which);
+    const ncfUInt32 count = found.track ? found.track->samples.Count() : 0;
+    if (count == 0) {
+        const std::string refused = header.WhyOfNoUse();
+        return refused.empty() ? "it has no frames"
+                               : refused + "; the multimedia library finds nothing to show in it";
+    }
+    return fmt::format("track {} of the file: {} none of its {}", found.place + 1,
+                       found.track->edits.IsEmpty() ? "its times show" : "its edits show",
+                       Counted(count, "sample"));
 }
 
 RouteTaken RouteOf(const std::filesystem::path& movie) {

@@ -32,6 +32,10 @@ struct WhichTrack {
 Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& which,
                         std::uint64_t sample = 0);
 
+// Why no sample of such a track is ever shown: there are none, or the edits leave
+// all of them out.
+std::string WhyNotShown(const std::filesystem::path& movie, const WhichTrack& which);
+
 // By which way a movie is read, and why not by the header parser where it refuses.
 struct RouteTaken {
     const char* route;

@@ -161,6 +161,20 @@ ncfUInt64 SampleTimes::DecodeTimeOf(ncfUInt32 sample) const {
     return run.decodeTime + ncfUInt64{sample - run.first} * Duration(run.entry);
 }
 
+ncfUInt32 SampleTimes::LongestSample() const {
+    ncfUInt32 longest = 0;
+    ncfUInt32 duration = 0;
+    ncfUInt32 first = 0;
+    for (ncfUInt32 entry = 0; entry < durationEntries_; ++entry) {
+        if (DurationCount(entry) > 0 && Duration(entry) > duration) {
+            longest = first;
+            duration = Duration(entry);
+        }
+        first += DurationCount(entry);
+    }
+    return longest;
+}
+
 ncfSInt64 SampleTimes::DisplayOffsetOf(ncfUInt32 sample) const {
     return offsets_ == nullptr ? 0 : Offset(OffsetRunOf(sample).entry) - shift_;
 }

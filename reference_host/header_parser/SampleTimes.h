@@ -33,7 +33,15 @@ public:
     bool IsReordered() const { return isReordered_; }
     bool HasOneDuration() const { return hasOneDuration_; }
     ncfUInt64 TotalDuration() const { return total_; }
+    // Where the last picture shown ends, on the axis that edits count on.
+    ncfUInt64 DisplayEnd() const {
+        const ncfSInt64 end = static_cast<ncfSInt64>(displayEnd_) + shift_;
+        return end < 0 ? 0 : static_cast<ncfUInt64>(end);
+    }
     ncfUInt64 MeanDuration() const { return sampleCount_ == 0 ? 0 : total_ / sampleCount_; }
+
+    // The first of the samples that last longest. There must be one.
+    ncfUInt32 LongestSample() const;
 
     // The sample on show at that time of the shifted display axis; false
     // behind the end.

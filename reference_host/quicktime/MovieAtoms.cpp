@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <fstream>
+#include <limits>
 
 namespace host {
 namespace {
@@ -98,6 +99,9 @@ private:
             case Code("tkhd"):
                 ReadTrackHeader(position, end);
                 return;
+            case Code("mdhd"):
+                ReadMediaHeader(position, end);
+                return;
             case Code("stsd"):
                 ReadDescriptions(position, end, depth);
                 return;
@@ -106,6 +110,9 @@ private:
                 return;
             case Code("elst"):
                 ReadEdits(position, end);
+                return;
+            case Code("stts"):
+                FindDurations(position, end);
                 return;
             case Code("stsc"):
                 ReadChunks(position, end);
@@ -142,6 +149,21 @@ private:
         const bool isLong = bytes[0] == 1;
         out_.tracks.back().id = static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
         out_.tracks.back().duration = isLong ? Number(bytes + 28, 8) : Number(bytes + 20, 4);
+    }
+
+    void ReadMediaHeader(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[32];
+        const std::size_t least = 20;
+        if (out_.tracks.empty() || end - position < least || !Read(position, bytes, least)) {
+            return;
+        }
+        const bool isLong = bytes[0] == 1;
+        if (isLong && (end - position < sizeof bytes || !Read(position, bytes, sizeof bytes))) {
+            return;
+        }
+        out_.tracks.back().mediaTimeScale =
+            static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
+        out_.tracks.back().mediaDuration = isLong ? Number(bytes + 24, 8) : Number(bytes + 16, 4);
     }
 
     void ReadEdits(ncfUInt64 position, ncfUInt64 end) {
@@ -201,6 +223,17 @@ private:
         const bool isLinear = code == Code("ipcm") || code == Code("fpcm");
         if (isLinear && size >= fields && size <= end - position) {
             Descend(position + fields, position + size, depth);
+        }
+    }
+
+    // The table may be long, and few ask for it.
+    void FindDurations(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[8];
+        if (!out_.tracks.empty() && !out_.tracks.back().durationsAt && end - position >= 8 &&
+            Read(position, bytes, sizeof bytes)) {
+            out_.tracks.back().durationsAt = position + 8;
+            out_.tracks.back().durationEntries =
+                static_cast<ncfUInt32>(std::min(Number(bytes + 4, 4), (end - position - 8) / 8));
         }
     }
 
@@ -274,6 +307,34 @@ const MovieAtoms::Track* MovieAtoms::Find(ncfUInt32 id) const {
         }
     }
     return nullptr;
+}
+
+std::optional<SampleDurations> SumDurations(const std::filesystem::path& path,
+                                            const MovieAtoms::Track& track) {
+    constexpr ncfUInt64 kMost = std::numeric_limits<ncfUInt64>::max() / 2;
+    std::ifstream stream(path, std::ios::binary);
+    if (!track.durationsAt ||
+        !stream.seekg(static_cast<std::streamoff>(track.durationsAt.value()))) {
+        return std::nullopt;
+    }
+    const auto number = [](const ncfUInt8* bytes) {
+        return ncfUInt64{bytes[0]} << 24 | ncfUInt64{bytes[1]} << 16 | ncfUInt64{bytes[2]} << 8 |
+               bytes[3];
+    };
+    SampleDurations sum;
+    ncfUInt8 entry[8];
+    for (ncfUInt32 i = 0; i < track.durationEntries; ++i) {
+        if (!stream.read(reinterpret_cast<char*>(entry), sizeof entry)) {
+            return std::nullopt;
+        }
+        const ncfUInt64 units = number(entry) * number(entry + 4);
+        if (units > kMost - sum.units) {
+            return std::nullopt;
+        }
+        sum.samples += number(entry);
+        sum.units += units;
+    }
+    return sum;
 }
 
 MovieAtoms ReadMovieAtoms(const std::filesystem::path& path) {

@@ -189,6 +189,9 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     AVDictionary* options = nullptr;
     // The bytes are at hand, so no way of reaching a file is needed.
     av_dict_set(&options, "protocol_whitelist", "none", 0);
+    // A track that names another as its chapters changes nothing of that other,
+    // which the library would take for no picture track.
+    av_dict_set(&options, "ignore_chapters", "1", 0);
     if (view == InputView::WholeMedia) {
         av_dict_set(&options, "ignore_editlist", "1", 0);
     }

@@ -19,6 +19,29 @@ std::string OpenProblem(const std::filesystem::path& path) {
     return MovieFile::Open(path, reason) ? std::string() : reason;
 }
 
+namespace {
+
+std::string DecoderProblemOf(const AVStream& stream) {
+    if (avcodec_find_decoder(stream.codecpar->codec_id)) {
+        return {};
+    }
+    char code[AV_FOURCC_MAX_STRING_SIZE] = {};
+    av_fourcc_make_string(code, stream.codecpar->codec_tag);
+    const AVCodecDescriptor* const known = avcodec_descriptor_get(stream.codecpar->codec_id);
+    return "track " + std::to_string(stream.index + 1) +
+           " of the file: no decoder is known for its codec '" + code + "'" +
+           (known ? std::string(", ") + known->long_name : std::string());
+}
+
+}  // namespace
+
+std::string DecoderProblem(const std::filesystem::path& path, std::size_t track) {
+    std::string reason;
+    const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
+    return input && track < input->nb_streams ? DecoderProblemOf(*input->streams[track])
+                                              : std::string();
+}
+
 std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place) {
     std::string reason;
     const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
@@ -32,15 +55,7 @@ std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std:
         if (place-- > 0) {
             continue;
         }
-        if (avcodec_find_decoder(stream.codecpar->codec_id)) {
-            return {};
-        }
-        char code[AV_FOURCC_MAX_STRING_SIZE] = {};
-        av_fourcc_make_string(code, stream.codecpar->codec_tag);
-        const AVCodecDescriptor* const known = avcodec_descriptor_get(stream.codecpar->codec_id);
-        return "track " + std::to_string(i + 1) +
-               " of the file: no decoder is known for its codec '" + code + "'" +
-               (known ? std::string(", ") + known->long_name : std::string());
+        return DecoderProblemOf(stream);
     }
     return {};
 }

@@ -14,6 +14,8 @@ std::string OpenProblem(const std::filesystem::path& path);
 // codec; empty when it finds one or there is no such track. `place` counts from 0
 // among the tracks of its kind.
 std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place);
+// The same of the track at that place of the file, whatever its kind.
+std::string DecoderProblem(const std::filesystem::path& path, std::size_t track);
 
 // Why the first picture track can't have pictures as large as the file tells; empty
 // when it can.

@@ -125,6 +125,61 @@ INSTANTIATE_TEST_SUITE_P(
         Case{"LongPictures", TwoLongPictures, "describe -q",
              "cliphost: a.mov: track 1 of the file: 2 pictures in 7200 seconds come to no rate of "
              "frames; the sound alone can be had: cliphost audio FILE --rate 48000 -o FILE.wav"},
+        Case{"OneEndlessPicture",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 29, 30, 1));
+                 movie.tracks[0].samples.push_back({1, 1000, 0x7FFFFFFF});
+                 movie.tracks[0].mediaDuration = 30;
+                 movie.tracks[0].trackDuration = 600;
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1 of the file: 30 pictures in 71582789 seconds come to no "
+             "rate of frames: sample 29 of its table alone lasts 71582788 seconds, 'mdhd' tells 1 "
+             "second of all"},
+        Case{"NoTimes",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 0));
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1 of the file: neither its samples nor its headers tell how "
+             "long it lasts"},
+        Case{"NoTimesBesideARefusal",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 1));
+                 movie.tracks[0].replaced = {movies::Box("stts").Version(0).U32(0)};
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1: 'stts' counts 0 samples, the track has 30 (at byte 490); "
+             "what the multimedia library reads makes no description either; -vv shows what it "
+             "logs"},
+        Case{"EditsThatShowNothing",
+             [] {
+                 movies::Movie movie = movies::Movie();
+                 movies::VideoFormat format;
+                 format.codec = "raw ";
+                 format.width = format.height = 8;
+                 movie.tracks = {movies::VideoTrack(format, 30, 30, 1, 192)};
+                 movie.tracks[0].edits = {{600, -1, 1.0}};
+                 return movies::Build(movie).ToBytes();
+             },
+             "frame -o o.png",
+             "cliphost: a.mov: track 1 of the file: its edits show none of its 30 samples"},
+        Case{"SoundWithoutSamples",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 1));
+                 movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 0));
+                 movie.tracks[1].mediaDuration = 48000;
+                 movie.tracks[1].trackDuration = 600;
+                 return movies::Build(movie).ToBytes();
+             },
+             "audio -o o.wav", "cliphost: a.mov: track 2 of the file: it holds no samples"},
         Case{"EncryptedPicture", [] { return WithCode(Made("png.mov"), "png ", "encv"); },
              "frame -o o.png",
              "cliphost: a.mov: track 1 of the file: its samples are encrypted "
@@ -254,6 +309,32 @@ TEST_F(Reasons, TellWhyAMovieIsReadTheSecondWay) {
     const Json& other = parsed.is_array() ? parsed[0] : parsed;
     EXPECT_EQ(other["route"], "header");
     EXPECT_FALSE(other.contains("routeReason"));
+}
+
+// The parser takes the header; the module makes no clip of a picture without size.
+TEST_F(Reasons, TellThatNoClipIsMadeOfAHeaderThatIsRead) {
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=64x48 -frames:v 1 " +
+                         In("a.jpg"))
+                  .status,
+              0);
+    const movies::Bytes picture = ReadFile(folder() / "a.jpg");
+    movies::VideoFormat format;
+    format.codec = "jpeg";
+    format.width = 0;
+    format.height = 48;
+    movies::Movie movie =
+        OneTrack(movies::VideoTrack(format, 2, 25, 1, static_cast<std::uint32_t>(picture.size())));
+    for (int i = 0; i < 2; ++i) {
+        movies::Bytes& data = movie.tracks[0].data;
+        data.insert(data.end(), picture.begin(), picture.end());
+    }
+    const CommandResult json =
+        RunCommand(Quoted(ProgramFolder() / "cliphost") + " describe --json " +
+                   Quoted(Write(movie)) + " 2>/dev/null");
+    const Json entry = Json::parse(json.out);
+    const Json& one = entry.is_array() ? entry[0] : entry;
+    EXPECT_EQ(one["route"], "library");
+    EXPECT_EQ(one["routeReason"], "track 1 of the file: 'jpeg' tells a size of 0 x 48");
 }
 
 }  // namespace

@@ -105,6 +105,30 @@ TEST(MovieAtoms, TellNoChangeWithinOneDescription) {
     EXPECT_TRUE(Read(movie).tracks.at(0).descriptionChanges.empty());
 }
 
+TEST(MovieAtoms, TellWhatSamplesLastInSum) {
+    movies::Movie movie = TwoDescriptions();
+    movie.tracks[0].samples[1].duration = 0xFFFFFFFF;
+    const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+    const auto sum =
+        host::SumDurations(file.Path(), host::ReadMovieAtoms(file.Path()).tracks.at(0));
+    ASSERT_TRUE(sum);
+    EXPECT_EQ(sum->samples, 16u);
+    EXPECT_EQ(sum->units, 5 + 7 * 0xFFFFFFFFull + 4);
+}
+
+TEST(MovieAtoms, SumUpNothingThatIsNotThereOrTooMuch) {
+    movies::Movie movie = TwoDescriptions();
+    EXPECT_FALSE(host::SumDurations("nowhere.mov", Read(movie).tracks.at(0)));
+    movie.tracks[0].omitted = {"stts"};
+    EXPECT_FALSE(host::SumDurations(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path(),
+                                    Read(movie).tracks.at(0)));
+    movie.tracks[0].omitted.clear();
+    movie.tracks[0].replaced = {
+        movies::Box("stts").Version(0).U32(1).U32(0xFFFFFFFF).U32(0xFFFFFFFF)};
+    EXPECT_FALSE(host::SumDurations(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path(),
+                                    Read(movie).tracks.at(0)));
+}
+
 // A table of chunks that goes back, or names more of them than it has, ends there.
 TEST(MovieAtoms, StopAtATableThatLies) {
     movies::Movie movie = TwoDescriptions();
