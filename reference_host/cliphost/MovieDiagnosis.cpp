@@ -29,7 +29,6 @@ constexpr const char* kNoLength = "The length of the movie can't be determined."
 constexpr const char* kNoTracks = "Movie doesn't contain any video/audio tracks!";
 
 constexpr const char* kCopyAgain = "copy the file again from where it came";
-constexpr const char* kConvert = "convert it with a program that knows this codec";
 
 constexpr ncfUInt32 kEncrypted[] = {Code("encv"), Code("enca"), Code("drmi"), Code("drms")};
 
@@ -151,8 +150,11 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
         return {movie, untimed};
     }
     for (const ncfUInt32 sound : TracksOf(header, TrackKind::Sound)) {
-        if (const std::string decoder = host::DecoderProblem(movie, sound); !decoder.empty()) {
-            return {movie, decoder, kConvert};
+        const Track& track = header.movie->tracks[sound];
+        if (!track.sound.empty() && track.sound.front().channels == 0) {
+            return {movie,
+                    fmt::format("track {} of the file: its sound, {}, has no channels", sound + 1,
+                                header_parser::NameOf(track.sound.front().codec))};
         }
     }
     return {};
@@ -260,7 +262,7 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
             ? host::DecoderProblem(movie, number)
             : host::DecoderProblem(movie, which.kind == TrackKind::Sound, which.place);
     if (!decoder.empty()) {
-        return because(decoder, kConvert);
+        return because(decoder, "convert it with a program that knows this codec");
     }
     if (which.kind != TrackKind::Sound) {
         if (const std::string raster = host::RasterProblem(movie); !raster.empty()) {
