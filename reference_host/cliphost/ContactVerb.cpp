@@ -63,7 +63,7 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     }
     const auto frames = SpreadFrames(reader.Count(), static_cast<std::uint64_t>(options.frames));
     if (frames.empty() || reader.width() == 0) {
-        throw Failure(kExitFile, options.movie, "it has no frames");
+        essence.FailSamples(track, fmt::format("track {}: it has no frames", track.number), NCF_OK);
     }
     const PictureTurn turn = options.turn.TurnFor(options.movie);
     ContactSheet sheet(static_cast<int>(frames.size()), options.columns, options.width,

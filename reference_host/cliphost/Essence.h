@@ -50,7 +50,7 @@ public:
 
     // Why nothing of a track can be delivered; nothing when it can.
     Problem Obstacle(const ClipTrack& track);
-    // Throws a Failure with the obstacle.
+    // Throws a Failure with the obstacle, also where the track lies in another file.
     void NeedDelivery(const ClipTrack& track);
 
     // Throws a Failure for a step that the module refused.
@@ -62,6 +62,11 @@ public:
     // Why a sample of a track could not be read; what is said where nothing but the
     // decoder could tell.
     Problem WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESULT result) const;
+
+    // What is known of the sound of a movie without description.
+    SoundAlone SoundOf(const ClipTrack& track) const;
+    // Whether the file is too short for some of its pictures.
+    bool LacksPictures() const;
 
 private:
     void Map(NMA::IMediaContainer3& container);
