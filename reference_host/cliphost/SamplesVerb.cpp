@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include <fmt/format.h>
 
+#include <algorithm>
+
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
@@ -114,7 +116,7 @@ void SamplesRun::ShowRuns(const RunMap& runs, Json& json) {
 
 void SamplesRun::ShowSums(const ClipTrack& track, const RunMap& runs, Json& json) {
     if (!wrong_ && !runs.faults.empty()) {
-        wrong_ = essence_.WhyUnread(track, 0, NCF_OK);
+        wrong_ = essence_.WhyUnread(track, std::max<std::uint64_t>(runs.samples, 1) - 1, NCF_OK);
         const bool isKnown = !wrong_.hint.empty();
         wrong_.reason = isKnown ? wrong_.reason
                                 : fmt::format("track {}: {}", track.number, runs.faults.front());
