@@ -106,12 +106,17 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     const std::uint64_t count = WantedCount(options, sound);
     WavForm form = sound.form();
     if (form.rate == 0) {
+        const SoundAlone alone = essence.SoundOf(track);
+        if (alone.problem) {
+            throw Failure(kExitFile, alone.problem);
+        }
+        if (options.rate == 0) {
+            throw Failure(kExitFile, options.movie,
+                          "its samples a second are not known, since the movie can't be described",
+                          alone.rate == 0 ? "give --rate, their number"
+                                          : fmt::format("give --rate {}", alone.rate));
+        }
         form.rate = options.rate;
-    }
-    if (form.rate == 0) {
-        throw Failure(kExitCaller, options.movie,
-                      "its samples a second are not known, since the movie can't be described",
-                      "give --rate, their number");
     }
     const std::vector<unsigned char> header = WavHeader(form, count);
     if (header.empty()) {

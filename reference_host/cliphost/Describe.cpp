@@ -29,6 +29,7 @@ Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRES
         const std::string way = problem.route;
         // The module reads its data files at the first picture of a clip that loads.
         problem = DataFileProblem(session);
+        problem.isOfProgram = true;
         if (!problem) {
             problem = {movie, "the module makes no description of it, and no more is known of why",
                        "-vv shows what it logs"};

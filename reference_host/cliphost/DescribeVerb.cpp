@@ -11,12 +11,11 @@
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
-#include "reference_host/cliphost/MovieDiagnosis.h"
-#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -32,14 +31,6 @@ struct DescribeOptions {
     bool json = false;
     bool quiet = false;
 };
-
-void TellRoute(const std::filesystem::path& movie) {
-    const RouteTaken taken = RouteOf(movie);
-    if (!taken.reason.empty()) {
-        Notice("{}: read by the multimedia library, since the header parser refuses it: {}\n",
-               DisplayPath(movie), taken.reason);
-    }
-}
 
 // Describes all that the command line names; one bad movie stops nothing.
 class DescribeRun {
@@ -114,6 +105,9 @@ void DescribeRun::DescribeFolder(const std::filesystem::path& folder) {
     for (const std::filesystem::path& name : clips.others().withBackslash) {
         Refuse(name, BackslashProblem(name), kExitCaller);
     }
+    for (const Problem& problem : clips.others().noFiles) {
+        Refuse(problem.subject, problem, kExitCaller);
+    }
     if (const Problem leftOut = LeftOut(folder, clips.others())) {
         TellProblem(leftOut, session_.verbosity());
     }
@@ -145,9 +139,7 @@ void DescribeRun::Take(const Description& description) {
         shown = isDevice ? shown : session_.aaf().Open(saved);
     }
     ++described_;
-    if (session_.verbosity() > 0) {
-        TellRoute(description.movie);
-    }
+    TellRoute(description.movie, session_.verbosity());
     if (OutputFile::IsStandardOutput(saved)) {
         return;  // what is shown would be in the midst of the file
     }
@@ -157,11 +149,7 @@ void DescribeRun::Take(const Description& description) {
         if (!saved.empty()) {
             entry["aaf"] = MachinePath(saved);
         }
-        const RouteTaken taken = RouteOf(description.movie);
-        entry["route"] = taken.route;
-        if (!taken.reason.empty()) {
-            entry["routeReason"] = taken.reason;
-        }
+        AddRoute(description.movie, entry);
         entry["description"] = nlohmann::ordered_json::parse(ToJson(tree));
         json_.push_back(std::move(entry));
         return;

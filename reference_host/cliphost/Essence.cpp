@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -160,9 +161,12 @@ Problem Essence::Obstacle(const ClipTrack& track) {
 }
 
 void Essence::NeedDelivery(const ClipTrack& track) {
-    const Problem obstacle = Obstacle(track);
-    if (obstacle) {
+    if (const Problem obstacle = Obstacle(track)) {
         throw Failure(kExitFile, obstacle);
+    }
+    // The library would read what lies at the same place of this file.
+    if (!WhatLiesElsewhere(movie_, Which(track)).empty()) {
+        FailSamples(track, {}, NCF_E_FAIL);
     }
 }
 
@@ -191,6 +195,14 @@ Problem Essence::WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESU
     return problem;
 }
 
+SoundAlone Essence::SoundOf(const ClipTrack& track) const {
+    return SoundWithoutDescription(movie_, Which(track).place);
+}
+
+bool Essence::LacksPictures() const {
+    return !WhatPictureLacks(movie_, 0).empty();
+}
+
 // The alpha is part of the picture.
 WhichTrack Essence::Which(const ClipTrack& track) const {
     WhichTrack which{track.kind};
@@ -207,6 +219,8 @@ Essence OpenEssence(Session& session, const std::filesystem::path& movie,
     if (essence.undescribed()) {
         TellProblem(essence.undescribed(), session.verbosity());
         Notice("  what can be mapped is served all the same\n");
+    } else {
+        TellRoute(movie, session.verbosity());
     }
     return essence;
 }

@@ -54,7 +54,7 @@ public:
 
     // Why nothing of a track can be delivered; nothing when it can.
     Problem Obstacle(const ClipTrack& track);
-    // Throws a Failure with the obstacle.
+    // Throws a Failure with the obstacle, also where the track lies in another file.
     void NeedDelivery(const ClipTrack& track);
 
     // Throws a Failure for a step that the module refused.
@@ -72,6 +72,10 @@ public:
     MissingSound MissingPart(const ClipTrack& track, unsigned rate) const {
         return {movie_, Which(track).place, rate};
     }
+    // What is known of the sound of a movie without description.
+    SoundAlone SoundOf(const ClipTrack& track) const;
+    // Whether the file is too short for some of its pictures.
+    bool LacksPictures() const;
 
 private:
     void Map(NMA::IMediaContainer3& container);

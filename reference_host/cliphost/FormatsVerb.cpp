@@ -7,6 +7,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
@@ -152,6 +153,8 @@ void Show(Essence& essence, bool json) {
         Json answer = {{"movie", MachinePath(essence.movie())}};
         if (essence.undescribed()) {
             AddProblem(essence.undescribed(), answer);
+        } else {
+            AddRoute(essence.movie(), answer);
         }
         answer["tracks"] = list;
         PrintJson(answer);

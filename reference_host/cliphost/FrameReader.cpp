@@ -14,6 +14,7 @@ namespace cliphost {
 
 FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::string& formatName)
     : essence_(essence), track_(track), request_(host::MakeRef<host::SampleRequest>()) {
+    essence_.NeedDelivery(track_);
     Choose(formatName);
     NMA::IUncompressedImageProvider& pictures = essence_.pictures();
     NCFRESULT result = pictures.SetWorkingImageFormat(track_.number, format_.index);
@@ -87,9 +88,10 @@ std::uint64_t FrameReader::Count() {
         return *count_;
     }
     std::uint64_t count = MostFrames();
-    // Edits can leave fewer pictures than the length says. Where they end is
-    // found by asking for one in the middle of what is open.
-    if (count > 1 && Read(count - 1) == NMA_E_NODATA) {
+    // Edits can leave fewer pictures than the length says, which is nothing wrong;
+    // a file that is cut has fewer too, and those count. Where edits end is found
+    // by asking for a picture in the middle of what is open.
+    if (count > 1 && Read(count - 1) == NMA_E_NODATA && !essence_.LacksPictures()) {
         std::uint64_t there = 0;
         while (there + 1 < count) {
             const std::uint64_t middle = there + (count - there) / 2;

@@ -2,59 +2,14 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/MissingMedia.h"
 
-#include <fmt/format.h>
-
-#include <algorithm>
-#include <optional>
+#include "reference_host/cliphost/MissingSamples.h"
 
 namespace cliphost {
 namespace {
 
-using header_parser::HeaderReport;
 using header_parser::Track;
 
-bool IsInFile(const Track& track) {
-    return !track.isInFile.empty() &&
-           std::find(track.isInFile.begin(), track.isInFile.end(), false) == track.isInFile.end();
-}
-
-// The first sample whose bytes lie behind the end. Samples follow each other in
-// the file.
-std::optional<ncfUInt32> FirstMissing(const HeaderReport& header, const Track& track) {
-    const auto isThere = [&](ncfUInt32 i) {
-        return track.samples.PositionOf(i) + track.samples.Sizes().SizeOf(i) <= header.fileSize;
-    };
-    const ncfUInt32 count = track.samples.Count();
-    if (count == 0 || !IsInFile(track) || isThere(count - 1)) {
-        return std::nullopt;
-    }
-    ncfUInt32 first = 0;
-    for (ncfUInt32 end = count - 1; first < end;) {
-        const ncfUInt32 middle = first + (end - first) / 2;
-        isThere(middle) ? first = middle + 1 : end = middle;
-    }
-    return first;
-}
-
 }  // namespace
-
-std::string WhatIsMissing(const HeaderReport& header, std::size_t place, std::uint64_t sample) {
-    const Track& track = header.movie->tracks[place];
-    const std::optional<ncfUInt32> first = FirstMissing(header, track);
-    if (!first || sample < *first) {
-        return {};
-    }
-    const ncfUInt64 begin = track.samples.PositionOf(0);
-    if (begin >= header.fileSize) {
-        return fmt::format(
-            "track {} of the file: its samples begin at byte {}, the file ends at byte {}",
-            place + 1, begin, header.fileSize);
-    }
-    return fmt::format(
-        "track {} of the file: the file ends at byte {}, so samples {} to {} of its table are "
-        "missing or cut off",
-        place + 1, header.fileSize, *first, track.samples.Count() - 1);
-}
 
 MissingSound::MissingSound(const std::filesystem::path& movie, std::size_t place, unsigned rate)
     : header_(header_parser::InspectHeaders(movie)), rate_(rate) {
@@ -66,9 +21,10 @@ MissingSound::MissingSound(const std::filesystem::path& movie, std::size_t place
         return;
     }
     const Track& track = header_.movie->tracks[sounds[place]];
-    if (const auto first = FirstMissing(header_, track); first && track.mediaTimeScale > 0) {
+    const MissingSamples missing(header_, sounds[place]);
+    if (const auto first = missing.Rest(); first && track.mediaTimeScale > 0) {
         track_ = &track;
-        reason_ = WhatIsMissing(header_, sounds[place], *first);
+        reason_ = missing.Sentence();
         mediaTime_ = static_cast<double>(track.samples.Times().DecodeTimeOf(*first));
     }
 }

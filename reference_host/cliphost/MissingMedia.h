@@ -4,18 +4,11 @@
 
 #include <cstdint>
 #include <filesystem>
-#include <memory>
 #include <string>
 
 #include "reference_host/header_parser/InspectHeaders.h"
 
 namespace cliphost {
-
-// Which samples of a track, by its place in the file, the file is too short for,
-// in a sentence; empty where it holds them all, or where `sample` of the table is
-// in front of them.
-std::string WhatIsMissing(const header_parser::HeaderReport& header, std::size_t place,
-                          std::uint64_t sample);
 
 // The part of a track's sound that the file is too short for.
 class MissingSound {

@@ -120,7 +120,8 @@ std::vector<std::filesystem::path> Session::MissingDataFiles() const {
     std::vector<std::filesystem::path> missing;
     for (const char* const name : {"FourCharMapper.xml", "AAFInfo.xml"}) {
         const std::filesystem::path file = plugin_->file().parent_path() / name;
-        if (!std::filesystem::is_regular_file(file)) {
+        std::error_code ignored;
+        if (!std::filesystem::exists(std::filesystem::symlink_status(file, ignored))) {
             missing.push_back(file);
         }
     }

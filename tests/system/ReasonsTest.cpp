@@ -349,4 +349,72 @@ TEST_F(Reasons, TellThatNoClipIsMadeOfAHeaderThatIsRead) {
     EXPECT_EQ(one.value("routeReason", ""), "track 1 of the file: 'jpeg' tells a size of 0 x 48");
 }
 
+// The library opens these, and makes no clip of them.
+TEST_F(Reasons, KeepWhatTheHeaderParserSays) {
+    Write(WithCode(Made("png.mov"), "stsd", "xxxx"), "a.mov");
+    const CommandResult told = RunCliphost("describe -q " + In("a.mov"));
+    ExpectSays(told, 1, "track 1: it lacks 'stsd', the sample descriptions (at byte ");
+    EXPECT_EQ(told.out.find("no more is known"), std::string::npos) << told.out;
+    EXPECT_EQ(told.out.find("no decoder"), std::string::npos) << told.out;
+}
+
+TEST_F(Reasons, TellWhyATrackHasNoFrames) {
+    Write(WithCode(Made("png.mov"), "stco", "xxxx"), "a.mov");
+    ExpectSays(RunCliphost("frame -o " + In("o.png") + " " + In("a.mov")), 1,
+               "track 1: it lacks 'stco', the places of its chunks");
+}
+
+TEST_F(Reasons, TellThatSoundIsEncryptedOrHasNoDecoder) {
+    Write(WithCode(Made("pcm_s16be.mov"), "twos", "enca"), "a.mov");
+    ExpectSays(RunCliphost("audio -o " + In("o.wav") + " " + In("a.mov")), 1,
+               "its samples are encrypted ('enca'); only who holds the key can read them");
+    Write(WithCode(Made("pcm_s16be.mov"), "twos", "xyz1"), "b.mov");
+    ExpectSays(RunCliphost("audio -o " + In("o.wav") + " " + In("b.mov")), 1,
+               "no decoder is known for its codec 'xyz1'");
+}
+
+TEST_F(Reasons, CountFramesThatACutFileLacks) {
+    const auto front = folder() / "front.mov";
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc=d=4:r=25:s=64x64 -c:v "
+                         "libx264 -pix_fmt yuv420p -movflags +faststart " +
+                         Quoted(front))
+                  .status,
+              0);
+    const movies::Bytes bytes = ReadFile(front);
+    Write(CutAt(bytes, bytes.size() * 3 / 4), "cut.mov");
+    const std::string words = "are missing or cut off; copy the file again";
+    ExpectSays(RunCliphost("frame --frame 98 -o " + In("o.png") + " " + In("cut.mov")), 1, words);
+    ExpectSays(RunCliphost("frame --range 0: -o " + In("all") + " " + In("cut.mov")), 1, words);
+    ExpectSays(RunCliphost("frame --frame 100 -o " + In("o.png") + " " + In("cut.mov")), 2,
+               "there is no frame 100; it has 100 frames, 0 to 99");
+    ExpectSays(RunCliphost("samples " + In("cut.mov")), 1, words);
+}
+
+TEST_F(Reasons, TellTheRouteInEveryVerb) {
+    const std::string movie =
+        " " + Quoted(std::filesystem::path(CLIPHOST_TYPE_FILES) / "fragmented.mp4");
+    const std::string words = "read by the multimedia library, since the header parser refuses it";
+    for (const char* const verb : {"formats", "samples", "params"}) {
+        ExpectSays(RunCliphost(std::string("-v ") + verb + movie), 0, words);
+        const CommandResult json = RunCommand(Quoted(ProgramFolder() / "cliphost") + " " + verb +
+                                              " --json" + movie + " 2>/dev/null");
+        const Json answer = Json::parse(json.out);
+        EXPECT_EQ(answer["route"], "library") << verb;
+        EXPECT_NE(answer["routeReason"].get<std::string>().find("fragmented"), std::string::npos);
+    }
+    ExpectSays(RunCliphost("-v frame -o " + In("o.png") + movie), 0, words);
+}
+
+TEST_F(Reasons, TellOfLinksInAFolder) {
+    std::filesystem::create_directory(folder() / "in");
+    std::filesystem::create_symlink("gone.mov", folder() / "in/a.mov");
+    const std::string words = "/in/a.mov leads to gone.mov, which is not there";
+    const CommandResult alone = RunCliphost("scan " + In("in"));
+    ExpectSays(alone, 1, words);
+    EXPECT_EQ(alone.out.find("no file there is named"), std::string::npos) << alone.out;
+    std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "in/b.mov");
+    ExpectSays(RunCliphost("scan " + In("in")), 2, words);
+    ExpectSays(RunCliphost("describe -q " + In("in")), 2, words);
+}
+
 }  // namespace
