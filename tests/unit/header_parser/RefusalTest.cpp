@@ -42,7 +42,7 @@ const std::map<std::string, Told> kTold = {
     {"moov_empty", {"moov", "'moov' holds no 'mvhd' (at byte 12)"}},
     {"moov_of_size_7", {"", "'moov' has the impossible size 7 (at byte 0)"}},
     {"moov_larger_than_the_file",
-     {"", "the movie header is 2147483647 bytes long, at most 1073741824 are read (at byte 0)"}},
+     {"", "the movie header claims 2147483647 bytes, at most 1073741824 are read (at byte 0)"}},
     {"moov_larger_than_any_file",
      {"", "'moov' has the impossible size 18446744073709551615 (at byte 0)"}},
     {"moov_to_the_end_without_end", {"moov", "'moov' holds no 'mvhd' (at byte 0)"}},

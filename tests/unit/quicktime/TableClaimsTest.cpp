@@ -81,6 +81,24 @@ TEST(TableClaims, OfFragmentsAreBounded) {
     EXPECT_EQ(ClaimOf(movie), "");
 }
 
+TEST(TableClaims, OfFragmentsNameTheTrackThatTheyGoOnWith) {
+    movies::Movie movie = Film();
+    movie.tracks.push_back(movie.tracks[0]);
+    movie.tracks[0].id = 7;
+    movie.tracks[1].id = 3;
+    const auto fragmentOf = [](std::uint32_t track) {
+        return Box("moof").Add(Box("traf")
+                                   .Add(Box("tfhd").Version(0).U32(track))
+                                   .Add(Box("trun").Version(0).U32(kMany)));
+    };
+    movie.trailing = {fragmentOf(7)};
+    EXPECT_EQ(ClaimOf(movie).rfind("track 1: 'trun' counts", 0), 0u) << ClaimOf(movie);
+    movie.trailing = {fragmentOf(3)};
+    EXPECT_EQ(ClaimOf(movie).rfind("track 2: 'trun' counts", 0), 0u) << ClaimOf(movie);
+    movie.trailing = {fragmentOf(5)};
+    EXPECT_EQ(ClaimOf(movie).rfind("'trun' counts", 0), 0u) << ClaimOf(movie);
+}
+
 // Each table alone is fine.
 TEST(TableClaims, AreAddedUp) {
     movies::Movie movie = Film();
