@@ -28,6 +28,9 @@ struct MovieAtoms {
         // number, 0 for none, and whether its low byte comes first.
         ncfUInt32 linearBits = 0;
         bool isLittleEndian = false;
+        // Of pictures, as the first description has it.
+        ncfUInt32 width = 0;
+        ncfUInt32 height = 0;
         std::vector<Edit> edits;  // none where some do not play as fast as the media
     };
     ncfUInt32 timeScale = 0;  // 0: no movie header was found
