@@ -203,8 +203,8 @@ private:
         }
     }
 
-    // Of the one kind of sound whose form stands in an atom behind the fields. In
-    // a list of the ISO form version 1 adds none.
+    // The size of pictures, and of the one kind of sound whose form stands in an
+    // atom behind the fields, that. In a list of the ISO form version 1 adds none.
     void ReadFirstDescription(ncfUInt64 position, ncfUInt64 end, bool isIso, int depth) {
         constexpr ncfUInt64 kFields = 36;
         constexpr ncfUInt64 kFieldsOfVersion1 = kFields + 16;
@@ -213,6 +213,8 @@ private:
         if (end - position < sizeof bytes || !Read(position, bytes, sizeof bytes)) {
             return;
         }
+        out_.tracks.back().width = static_cast<ncfUInt32>(Number(bytes + 32, 2));
+        out_.tracks.back().height = static_cast<ncfUInt32>(Number(bytes + 34, 2));
         const ncfUInt64 size = Number(bytes, 4);
         const ncfUInt64 code = Number(bytes + 4, 4);
         const ncfUInt64 version = Number(bytes + 16, 2);

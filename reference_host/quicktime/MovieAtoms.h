@@ -34,6 +34,9 @@ struct MovieAtoms {
         // Where the table of sample durations is, behind its count. None: no table.
         std::optional<ncfUInt64> durationsAt;
         ncfUInt32 durationEntries = 0;
+        // Of pictures, as the first description has it.
+        ncfUInt32 width = 0;
+        ncfUInt32 height = 0;
         std::vector<Edit> edits;  // none where some do not play as fast as the media
     };
     ncfUInt32 timeScale = 0;  // 0: no movie header was found

@@ -137,6 +137,24 @@ void NameFloatSound(AVFormatContext& input, const std::filesystem::path& path) {
     }
 }
 
+// Of MPEG-4 the library keeps the size that the first samples tell. That of the
+// description counts, as for all others: it is what a host makes its buffers for.
+void TakeSizesOfDescriptions(AVFormatContext& input, const std::filesystem::path& path) {
+    const MovieAtoms atoms = ReadMovieAtoms(path);
+    for (unsigned i = 0; i < input.nb_streams; ++i) {
+        AVCodecParameters& form = *input.streams[i]->codecpar;
+        const auto id = static_cast<ncfUInt32>(input.streams[i]->id);
+        const bool isOne = std::count_if(atoms.tracks.begin(), atoms.tracks.end(),
+                                         [id](const auto& each) { return each.id == id; }) == 1;
+        const auto* const track = isOne ? atoms.Find(id) : nullptr;
+        if (form.codec_type == AVMEDIA_TYPE_VIDEO && track && track->width > 0 &&
+            track->height > 0) {
+            form.width = static_cast<int>(track->width);
+            form.height = static_cast<int>(track->height);
+        }
+    }
+}
+
 int CountChannels(const AVFormatContext& input) {
     int channels = 0;
     for (unsigned i = 0; i < input.nb_streams && channels <= kMostChannelsOfMovie; ++i) {
@@ -208,6 +226,9 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     }
     if (CountChannels(*input) <= kMostChannelsOfMovie && !AreStreamsKnown(*input)) {
         FindStreamDetails(*input);
+        if (IsMovieFamily(*input)) {
+            TakeSizesOfDescriptions(*input, path);
+        }
     }
     reason = FindFault(*input);
     return reason.empty() ? std::move(input) : nullptr;

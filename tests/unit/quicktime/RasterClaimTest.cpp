@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <string>
 
+#include "reference_host/quicktime/MovieFile.h"
 #include "reference_host/quicktime/PictureReader.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
@@ -36,9 +37,8 @@ std::string ClaimOf(const MadeMovie& movie) {
     return claim;
 }
 
-// Of MPEG-4 the library takes the size that the decoder's configuration holds.
 constexpr const char* kEncoders[] = {"libx264", "prores_ks", "mjpeg", "png",      "qtrle", "smc",
-                                     "cinepak", "jpeg2000",  "v210",  "rawvideo", "targa"};
+                                     "cinepak", "jpeg2000",  "v210",  "rawvideo", "targa", "mpeg4"};
 
 class EveryRaster : public testing::TestWithParam<const char*> {
 protected:
@@ -75,6 +75,19 @@ TEST(RasterClaim, OfLargePicturesOfOneColourIsTrue) {
                               encoder);
         EXPECT_EQ(host::FindImpossibleRaster(movie.Path(), 0), "");
     }
+}
+
+// The library would take the size that the samples tell.
+TEST(RasterClaim, OfMpeg4IsThatOfItsDescription) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie("-f lavfi -i testsrc=s=64x48:r=25 -frames:v 3 -c:v mpeg4", ".mov");
+    const MadeMovie retold = Retold(movie, 80, 60);
+    std::string reason;
+    const auto opened = host::MovieFile::Open(retold.Path(), reason);
+    ASSERT_TRUE(opened) << reason;
+    const auto raster = opened->RasterOf(opened->FirstVideo());
+    EXPECT_EQ(raster.width, 80);
+    EXPECT_EQ(raster.height, 60);
 }
 
 // The decoder is told how much it may ask for, so that nothing is allocated.
