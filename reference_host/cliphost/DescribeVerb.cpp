@@ -13,7 +13,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
-#include "reference_host/cliphost/OutputProblem.h"
+#include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
@@ -59,8 +59,9 @@ private:
 };
 
 int DescribeRun::Run() {
+    std::optional<OutputFolder> folder;
     if (!options_.outFolder.empty()) {
-        MakeOutputFolder(options_.outFolder);
+        folder.emplace(options_.outFolder);
     }
     for (const std::filesystem::path& path : options_.paths) {
         std::error_code ignored;

@@ -72,12 +72,4 @@ int SystemErrorIn(std::string_view sentence) {
     return 0;
 }
 
-void MakeOutputFolder(const std::filesystem::path& folder) {
-    std::error_code error;
-    std::filesystem::create_directories(folder, error);
-    if (error) {
-        throw Failure(kExitCaller, FolderNotMade(folder, error.value()));
-    }
-}
-
 }  // namespace cliphost

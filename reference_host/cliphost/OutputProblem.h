@@ -18,7 +18,4 @@ Problem FolderNotMade(const std::filesystem::path& folder, int error);
 // these are no words of the system.
 int SystemErrorIn(std::string_view sentence);
 
-// Makes a folder for outputs, and those on the way to it. Throws a Failure.
-void MakeOutputFolder(const std::filesystem::path& folder);
-
 }  // namespace cliphost

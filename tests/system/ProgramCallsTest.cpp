@@ -72,6 +72,15 @@ TEST_F(ProgramCalls, GoOnAfterADescriptionThatCantBeSaved) {
     EXPECT_TRUE(std::filesystem::is_regular_file(folder() / "out" / "b.aaf"));
 }
 
+TEST_F(ProgramCalls, LeaveNoEmptyFolderBehind) {
+    std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "a.mov");
+    std::filesystem::resize_file(folder() / "a.mov", 20);
+    EXPECT_EQ(RunCliphost("describe -q --out-dir " + Out("out/in") + " " + Out("a.mov")).status, 1);
+    EXPECT_FALSE(std::filesystem::exists(folder() / "out"));
+    EXPECT_NE(RunCliphost("frame -o " + Out("out") + " " + Out("a.mov")).status, 0);
+    EXPECT_FALSE(std::filesystem::exists(folder() / "out"));
+}
+
 TEST_F(ProgramCalls, GiveEachDescriptionAFileOfItsOwn) {
     std::filesystem::create_directory(folder() / "x");
     const auto movies = Copy("png.mov", "a.mov") + " " + Copy("png.mov", "x/a.mov") + " " +

@@ -44,18 +44,3 @@ TEST(OutputProblem, FindsTheSystemsErrorInASentenceOfTheLibrary) {
     EXPECT_EQ(SystemErrorIn("a name is too long for a stream"), 0);
     EXPECT_EQ(SystemErrorIn(""), 0);
 }
-
-TEST(OutputProblem, EndsAVerbWhereAFolderCantBeMade) {
-    const TestFolder folder;
-    MakeOutputFolder(folder / "a/b");
-    EXPECT_TRUE(std::filesystem::is_directory(folder / "a/b"));
-    MakeOutputFolder(folder / "a/b");
-    WriteFile(folder / "file", "x");
-    try {
-        MakeOutputFolder(folder / "file/b");
-        ADD_FAILURE() << "it was made";
-    } catch (const Failure& failure) {
-        EXPECT_EQ(failure.status(), kExitCaller);
-        EXPECT_EQ(failure.problem().reason, "the folder can't be made: Not a directory");
-    }
-}
