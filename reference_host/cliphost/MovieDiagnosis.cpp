@@ -224,8 +224,8 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
         return because(decoder, "convert it with a program that knows this codec");
     }
     if (which.kind != TrackKind::Sound) {
-        if (const std::string raster = host::RasterProblem(movie); !raster.empty()) {
-            return because(raster, "its description is damaged: " + std::string(kCopyAgain));
+        if (const Problem raster = WrongRaster(movie)) {
+            return because(raster.reason, raster.hint);
         }
     }
     if (track) {
@@ -238,6 +238,13 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
 
 RouteTaken RouteOf(const std::filesystem::path& movie) {
     return RouteOf(header_parser::InspectHeaders(movie));
+}
+
+Problem WrongRaster(const std::filesystem::path& movie) {
+    const std::string raster = host::RasterProblem(movie);
+    return raster.empty()
+               ? Problem{}
+               : Problem{movie, raster, "its description is damaged: " + std::string(kCopyAgain)};
 }
 
 }  // namespace cliphost

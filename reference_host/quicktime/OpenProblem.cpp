@@ -60,4 +60,8 @@ std::string RasterProblem(const std::filesystem::path& path) {
     return {};
 }
 
+bool NeedsRasterCheck(const std::filesystem::path& path) {
+    return TellsLargePictures(path);
+}
+
 }  // namespace host
