@@ -7,6 +7,7 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/DataFiles.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
+#include "reference_host/quicktime/OpenProblem.h"
 
 namespace cliphost {
 namespace {
@@ -17,6 +18,9 @@ void Finish(Session& session, Description& description) {
         description.problem = ProblemWith(session, description.movie, description.result);
     } else {
         session.TakeNotices();
+        if (host::NeedsRasterCheck(description.movie)) {
+            description.doubt = WrongRaster(description.movie);
+        }
     }
 }
 

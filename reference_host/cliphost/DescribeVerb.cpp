@@ -126,6 +126,9 @@ void DescribeRun::Take(const Description& description) {
         Refuse(description.movie, description.problem, StatusOf(description.problem));
         return;
     }
+    if (description.doubt) {
+        TellProblem(description.doubt, session_.verbosity());
+    }
     std::filesystem::path saved;
     AafRef<IAAFFile> shown = description.file;
     if (!options_.aafFile.empty() || !options_.outFolder.empty()) {

@@ -421,8 +421,8 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
         return because(problem.reason, problem.hint);
     }
     if (!ofSound) {
-        if (const std::string raster = host::RasterProblem(movie); !raster.empty()) {
-            return because(raster, "its description is damaged: " + std::string(kCopyAgain));
+        if (const Problem raster = WrongRaster(movie)) {
+            return because(raster.reason, raster.hint);
         }
     }
     // What is only left to the library is nothing wrong.
@@ -489,6 +489,13 @@ std::string WhatLiesElsewhere(const std::filesystem::path& movie, const WhichTra
 
 RouteTaken RouteOf(const std::filesystem::path& movie) {
     return RouteOf(header_parser::InspectHeaders(movie));
+}
+
+Problem WrongRaster(const std::filesystem::path& movie) {
+    const std::string raster = host::RasterProblem(movie);
+    return raster.empty()
+               ? Problem{}
+               : Problem{movie, raster, "its description is damaged: " + std::string(kCopyAgain)};
 }
 
 }  // namespace cliphost

@@ -56,4 +56,8 @@ struct RouteTaken {
 };
 RouteTaken RouteOf(const std::filesystem::path& movie);
 
+// Why the pictures of a movie can't be as large as its description says; nothing
+// where they can.
+Problem WrongRaster(const std::filesystem::path& movie);
+
 }  // namespace cliphost

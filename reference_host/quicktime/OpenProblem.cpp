@@ -129,4 +129,8 @@ std::string RasterProblem(const std::filesystem::path& path) {
     return {};
 }
 
+bool NeedsRasterCheck(const std::filesystem::path& path) {
+    return TellsLargePictures(path);
+}
+
 }  // namespace host

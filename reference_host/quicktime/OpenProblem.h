@@ -30,5 +30,7 @@ CodecProblem DecoderProblem(const std::filesystem::path& path, std::size_t track
 // Why the first picture track can't have pictures as large as the file tells; empty
 // when it can.
 std::string RasterProblem(const std::filesystem::path& path);
+// Whether a movie's header tells pictures large enough to ask for that: a quick look.
+bool NeedsRasterCheck(const std::filesystem::path& path);
 
 }  // namespace host

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 
+#include "reference_host/quicktime/MovieAtoms.h"
 #include "reference_host/quicktime/OpenInput.h"
 
 namespace host {
@@ -83,6 +84,13 @@ bool TellsLargePictures(const AVCodecParameters& form) {
     return Raster{form.width, form.height}.Pixels() > kAlwaysFine;
 }
 
+bool TellsLargePictures(const std::filesystem::path& path) {
+    const MovieAtoms atoms = ReadMovieAtoms(path);
+    return std::any_of(atoms.tracks.begin(), atoms.tracks.end(), [](const auto& track) {
+        return std::int64_t{track.width} * track.height > kAlwaysFine;
+    });
+}
+
 std::int64_t MostPixels(const AVCodecParameters& form) {
     return std::max(kAlwaysFine, kMostTimes * Raster{form.width, form.height}.Pixels());
 }
@@ -99,8 +107,8 @@ std::string FindImpossibleRaster(const std::filesystem::path& path, int stream) 
     const std::int64_t own = samples.own.Pixels();
     const bool isTooSmall = TellsLargePictures(form) && own > 0 && own < told.Pixels() / kMostTimes;
     if (isTooSmall || own > MostPixels(form)) {
-        return "the file tells pictures of " + told.Words() + ", and its samples hold such of " +
-               samples.own.Words();
+        return "the file tells pictures of " + told.Words() +
+               ", and its samples hold pictures of " + samples.own.Words();
     }
     if (TellsLargePictures(form) && own == 0 && samples.largest > 0 &&
         samples.largest < told.Pixels() / kMostPixelsOfAByte) {

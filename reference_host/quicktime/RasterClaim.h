@@ -15,6 +15,8 @@ namespace host {
 // the same.
 
 bool TellsLargePictures(const AVCodecParameters& form);
+// Whether a movie file tells them of any of its tracks, by a look at its header.
+bool TellsLargePictures(const std::filesystem::path& path);
 
 // The most pixels that a decoder may make a picture of, for a stream whose pictures
 // have the size that `form` tells.

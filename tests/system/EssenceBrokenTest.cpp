@@ -54,6 +54,45 @@ protected:
     }
 };
 
+// Nobody makes room for what the file can't hold, and every verb that gives or
+// promises pictures says why.
+TEST_F(EssenceBroken, PicturesOfAFalseSizeAreNamedByEveryVerb) {
+    const auto movie = folder() / "large.mov";
+    for (const char* const encoder : {"mpeg4", "png", "rawvideo"}) {
+        SCOPED_TRACE(encoder);
+        ASSERT_EQ(
+            RunCommand("ffmpeg -nostdin -y -v error -f lavfi -i testsrc=s=64x48:r=25 -f lavfi "
+                       "-i sine -t 0.12 -c:a pcm_s16le -c:v " +
+                       std::string(encoder) + " " + Quoted(movie))
+                .status,
+            0);
+        movies::Bytes bytes = ReadFile(movie);
+        const std::string table = "stsd";
+        const auto description =
+            std::search(bytes.begin(), bytes.end(), table.begin(), table.end());
+        ASSERT_GT(bytes.end() - description, 48);
+        std::fill_n(description + 44, 4, std::uint8_t{0xFF});
+        Write(bytes, movie.filename().string());
+        const std::string reason =
+            "cliphost: " + movie.string() +
+            ": track 1 of the file: the file tells pictures of 65535 x 65535, ";
+        const std::string output = " -o " + Quoted(folder() / "a.png");
+        for (const std::string verb : {"formats", "frame", "contact", "describe"}) {
+            SCOPED_TRACE(verb);
+            const bool isDescribed = verb == "describe";
+            const bool isWritten = verb == "frame" || verb == "contact";
+            const CommandResult ran = RunCliphost(verb + (isDescribed ? " --quiet " : " ") +
+                                                  Quoted(movie) + (isWritten ? output : ""));
+            ExpectSays(ran, isDescribed ? 0 : 1, "its description is damaged: copy the file again");
+            EXPECT_EQ(ran.out.rfind(reason, 0), 0u) << ran.out;
+        }
+        EXPECT_FALSE(std::filesystem::exists(folder() / "a.png"));
+        const CommandResult sound =
+            RunCliphost("audio " + Quoted(movie) + " -o " + Quoted(folder() / "a.wav"));
+        EXPECT_EQ(sound.status, 0) << sound.out;
+    }
+}
+
 // Each picture of these stands alone, so only the damaged one may suffer.
 TEST_F(EssenceBroken, PictureFailsAndAllOthersAreServed) {
     for (const char* const name : {"png.mov", "mjpeg.mov", "prores_with_pcm.mov"}) {

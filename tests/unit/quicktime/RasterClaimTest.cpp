@@ -77,6 +77,15 @@ TEST(RasterClaim, OfLargePicturesOfOneColourIsTrue) {
     }
 }
 
+TEST(RasterClaim, OfLargePicturesIsSeenInTheHeader) {
+    NEEDS_FFMPEG();
+    const MadeMovie movie("-f lavfi -i testsrc=s=64x48:r=25 -f lavfi -i sine -t 0.1 -c:v mpeg4",
+                          ".mov");
+    EXPECT_FALSE(host::TellsLargePictures(movie.Path()));
+    EXPECT_FALSE(host::TellsLargePictures(Retold(movie, 4096, 4096).Path()));
+    EXPECT_TRUE(host::TellsLargePictures(Retold(movie, 4096, 4097).Path()));
+}
+
 // The library would take the size that the samples tell.
 TEST(RasterClaim, OfMpeg4IsThatOfItsDescription) {
     NEEDS_FFMPEG();
@@ -96,7 +105,7 @@ TEST(RasterClaim, IsABoundForTheDecoderToo) {
     const MadeMovie movie("-f lavfi -i color=s=4800x4800:r=25 -frames:v 1 -c:v mjpeg");
     const MadeMovie retold = Retold(movie, 64, 48);
     EXPECT_EQ(host::FindImpossibleRaster(retold.Path(), 0),
-              "the file tells pictures of 64 x 48, and its samples hold such of 4800 x 4800");
+              "the file tells pictures of 64 x 48, and its samples hold pictures of 4800 x 4800");
     const auto reader = host::PictureReader::Open(retold.Path(), 0, true);
     std::shared_ptr<const AVFrame> frame;
     ASSERT_TRUE(reader);

@@ -60,6 +60,19 @@ TEST(TableClaims, OfSamplesOfOneSizeAreBounded) {
     EXPECT_NE(ClaimWith(Box("stz2").Version(0).U32(8).U32(kMany)), "");
 }
 
+// However small the samples, a file holds no more of them than bytes.
+TEST(TableClaims, OfSamplesMayBeAsManyAsAFileHasBytes) {
+    movies::Movie movie = Film();
+    movie.trailing = {Box("free").Zeros(host::kClaimsAlwaysFine)};
+    movie.tracks[0].replaced = {Box("stsz").Version(0).U32(1).U32(1)};
+    const auto length = static_cast<std::uint32_t>(movies::Build(movie).ToBytes().size());
+    ASSERT_GT(length, host::kClaimsAlwaysFine);
+    movie.tracks[0].replaced = {Box("stsz").Version(0).U32(1).U32(length)};
+    EXPECT_EQ(ClaimOf(movie), "");
+    movie.tracks[0].replaced = {Box("stsz").Version(0).U32(1).U32(length + 1)};
+    EXPECT_NE(ClaimOf(movie), "");
+}
+
 TEST(TableClaims, OfDisplayTimesAreBounded) {
     EXPECT_NE(ClaimWith(Box("ctts").Version(0).U32(2).U32(10).U32(0).U32(kMany).U32(1)), "");
     EXPECT_EQ(ClaimWith(Box("ctts").Version(0).U32(2).U32(10).U32(0).U32(1).U32(1)), "");
