@@ -37,10 +37,6 @@ Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRES
         if (!problem) {
             problem = {movie, "the module makes no description of it, and no more is known of why",
                        "-vv shows what it logs"};
-            if (const std::string refused = RouteOf(movie).reason; !refused.empty()) {
-                problem.reason =
-                    refused + "; what the multimedia library reads makes no description either";
-            }
         }
         problem.route = way;
     }

@@ -344,10 +344,22 @@ bool MovieFile::MayHoldFieldsApart(int stream) const {
            form.codec_id == AV_CODEC_ID_H264 && form.field_order != AV_FIELD_PROGRESSIVE;
 }
 
+// Whether a track of a movie whose tables stand in its header has samples at all.
+// Edits may show none of them.
+bool MovieFile::HoldsSamples(int stream) const {
+    if (avformat_index_get_entries_count(input_->streams[stream]) > 0) {
+        return true;
+    }
+    std::string ignored;
+    const InputOwner whole = OpenInput(path_, InputView::WholeMedia, ignored);
+    return whole && stream < static_cast<int>(whole->nb_streams) &&
+           avformat_index_get_entries_count(whole->streams[stream]) > 0;
+}
+
 double MovieFile::PictureRate() {
     const ncfUInt32 track = FirstVideo();
     const int stream = StreamOf(track);
-    if (stream < 0) {
+    if (stream < 0 || (IndexIsWhole() && !HoldsSamples(stream))) {
         return 0.0;
     }
     const auto ofTable = IndexIsWhole() ? RateOfTable(stream) : std::nullopt;

@@ -84,6 +84,7 @@ private:
     bool NeedsPacketTimes() const;
     bool MayHoldFieldsApart(int stream) const;
     std::optional<double> RateOfTable(int stream) const;
+    bool HoldsSamples(int stream) const;
     double MeanRateOfMedia(int stream) const;
     double MeanRateOfPackets(int stream);
     double SecondsOfPackets(int stream);

@@ -360,6 +360,8 @@ TEST_F(Reasons, TellWhyATrackHasNoFrames) {
     Write(WithCode(Made("png.mov"), "stco", "xxxx"), "a.mov");
     ExpectSays(RunCliphost("frame -o " + In("o.png") + " " + In("a.mov")), 1,
                "track 1: it lacks 'stco', the places of its chunks");
+    ExpectSays(RunCliphost("describe -q " + In("a.mov")), 1,
+               "track 1: it lacks 'stco', the places of its chunks");
 }
 
 TEST_F(Reasons, TellThatSoundIsEncryptedOrHasNoDecoder) {

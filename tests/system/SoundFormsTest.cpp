@@ -101,6 +101,20 @@ std::size_t InEditUnits(double seconds, std::size_t rate) {
     return static_cast<std::size_t>(seconds * 25) * rate / 25;
 }
 
+// The high byte of a sample of 24 bits.
+int HighByte(const EssenceBytes& sound, std::size_t sample) {
+    return static_cast<signed char>(sound.at(sample * 3 + 2));
+}
+
+// How often the samples of a range rise through zero.
+int RisesIn(const EssenceBytes& sound, std::size_t from, std::size_t count) {
+    int rises = 0;
+    for (std::size_t i = from; i < from + count; ++i) {
+        rises += HighByte(sound, i) < 0 && HighByte(sound, i + 1) >= 0;
+    }
+    return rises;
+}
+
 constexpr char kHum[] = "-f lavfi -i sine=440:d=1:sample_rate=";
 
 TEST_F(SoundForms, OfCompressedSoundAreThoseThatItsDecoderGives) {
@@ -198,14 +212,11 @@ TEST_F(SoundForms, ThatChangeTheRateOnTheWayAreResampled) {
     // A second out of the middle of the second half rises through zero a
     // thousand times, at the level of the first.
     const std::size_t from = first.size() * 1152 + 22050;
-    int rises = 0;
     int loudest = 0;
     for (std::size_t i = from; i < from + 44100; ++i) {
-        const auto high = [&](std::size_t at) { return static_cast<signed char>(got[at * 3 + 2]); };
-        rises += high(i) < 0 && high(i + 1) >= 0;
-        loudest = std::max(loudest, std::abs(static_cast<int>(high(i))));
+        loudest = std::max(loudest, std::abs(HighByte(got, i)));
     }
-    EXPECT_NEAR(rises, 1000, 1);
+    EXPECT_NEAR(RisesIn(got, from, 44100), 1000, 1);
     EXPECT_NEAR(loudest, 16, 1);  // an eighth of full scale
     ExpectRangesOf(movie, got);
 }
@@ -268,12 +279,7 @@ TEST_F(SoundForms, OfExtensionsOfAacThatNothingAnnouncesAreThoseOfTheCore) {
     EXPECT_EQ(said.length, std::to_string(InEditUnits(seconds, 22050)));
     const EssenceBytes got = Delivered(movie);
     ASSERT_EQ(got.size(), InEditUnits(seconds, 22050) * 3);
-    int rises = 0;
-    for (std::size_t i = 11025; i < 11025 + 22050; ++i) {
-        const auto high = [&](std::size_t at) { return static_cast<signed char>(got[at * 3 + 2]); };
-        rises += high(i) < 0 && high(i + 1) >= 0;
-    }
-    EXPECT_NEAR(rises, 440, 1);
+    EXPECT_NEAR(RisesIn(got, 11025, 22050), 440, 1);
     ExpectRangesOf(movie, got);
 }
 
@@ -311,17 +317,7 @@ TEST_F(SoundForms, HaveTheRateOfTheFieldsWhateverThePacketsHave) {
     const double seconds = static_cast<double>(packets.size()) * 1152 / 44100;
     EXPECT_EQ(said.length, std::to_string(InEditUnits(seconds, 48000)));
     const EssenceBytes got = Delivered(movie);
-    const auto rises = [&](std::size_t from, std::size_t to) {
-        int count = 0;
-        for (std::size_t i = from; i + 1 < to; ++i) {
-            const auto high = [&](std::size_t at) {
-                return static_cast<signed char>(got.at(at * 3 + 2));
-            };
-            count += high(i) < 0 && high(i + 1) >= 0;
-        }
-        return count;
-    };
-    EXPECT_NEAR(rises(4800, 4800 + 24000), 220, 1);
+    EXPECT_NEAR(RisesIn(got, 4800, 24000), 220, 1);
     ExpectRangesOf(movie, got);
 }
 

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include "tests/unit/cliphost/StubSampleMap.h"
+
 using cliphost::MappedSample;
 using cliphost::ReadMappedSample;
 using cliphost::ReadRuns;
@@ -18,7 +20,7 @@ struct Stored {
 
 // A map over a list of samples, which answers as a module does: the size in 32
 // bits, runs as far as bytes follow each other.
-class FakeMap final : public NMA::ISampleMapping {
+class FakeMap final : public cliphost_tests::StubSampleMap {
 public:
     explicit FakeMap(std::vector<Stored> samples) : samples_(std::move(samples)) {}
 
@@ -28,11 +30,6 @@ public:
     NCFRESULT offsetResult = NCF_OK;
     std::size_t sizeQueries = 0;
 
-    NCFRESULT QueryInterface(const GUID&, void**) override { return NCF_E_NOINTERFACE; }
-    ncfUInt32 AddRef() override { return 1; }
-    ncfUInt32 Release() override { return 1; }
-    ncfSInt32 GetNumberOfTracks() override { return 1; }
-    NCFRESULT GetNumberOfChannels(ncfUInt32, ncfUInt32*) override { return NCF_E_NOTIMPL; }
     NCFRESULT GetNumberOfSamples(ncfUInt32 track, ncfUInt64* count) override {
         if (track != 0) {
             return NCF_E_FAIL;
@@ -40,7 +37,6 @@ public:
         *count = samples_.size();
         return NCF_OK;
     }
-    NCFRESULT GetSampleStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return NCF_E_NOTIMPL; }
     NCFRESULT GetSampleSize(ncfUInt32, ncfUInt64 sample, ncfUInt64* size) override {
         ++sizeQueries;
         if (sample >= samples_.size()) {
@@ -67,28 +63,6 @@ public:
         *dependencies = 1;
         return NCF_OK;
     }
-    NCFRESULT GetSampleDependency(ncfUInt32, ncfUInt64, ncfUInt32, ncfSInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetNumberOfEncodedUnits(ncfUInt32, ncfUInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetEncodedUnitStride(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitPosition(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitSize(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitSizeInSamples(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitFirstSample(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitContainingSample(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
     NCFRESULT GetNumberOfContiguousSamples(ncfUInt32, ncfUInt64, ncfSInt64* count) override {
         *count = -1;
         return NCF_OK;
@@ -105,16 +79,6 @@ public:
         *bytes = last.position + last.size - begin + wrongBytes;
         return NCF_OK;
     }
-    NCFRESULT GetNumberOfContiguousEncodedUnits(ncfUInt32, ncfUInt64, ncfSInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT RegisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT UnregisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT SetStorageCallback(INCFUnknown*) override { return NCF_E_NOTIMPL; }
 };
 
 const std::vector<Stored> kTwoRuns = {{100, 10}, {110, 20}, {130, 5}, {500, 7}, {507, 1}};
