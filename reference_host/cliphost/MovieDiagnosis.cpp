@@ -413,17 +413,18 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
         }
     }
     const bool ofSound = which.kind == TrackKind::Sound;
+    // A decoder refuses such a size too, and does not say why.
+    if (!ofSound) {
+        if (const Problem raster = WrongRaster(movie)) {
+            return because(raster.reason, raster.hint);
+        }
+    }
     // Tracks of a header that is read are those of the library, place by place.
     if (const host::CodecProblem codec = track && taken.reason.empty()
                                              ? host::DecoderProblem(movie, number)
                                              : host::DecoderProblem(movie, ofSound, which.place)) {
         const Problem problem = OfCodec(movie, codec);
         return because(problem.reason, problem.hint);
-    }
-    if (!ofSound) {
-        if (const Problem raster = WrongRaster(movie)) {
-            return because(raster.reason, raster.hint);
-        }
     }
     // What is only left to the library is nothing wrong.
     if (header.refusal && header.refusal.code != NCF_E_NOTSUPPORTED) {
