@@ -14,7 +14,11 @@ make_movies() { # make_movies FOLDER
   make() { # make NAME FFMPEG-ARGUMENTS...
     local name=$1
     shift
-    [ -s "$folder/$name" ] || ffmpeg -nostdin -y -loglevel error "$@" -metadata creation_time=2026-01-31T12:00:00Z "$folder/$name"
+    [ ! -s "$folder/$name" ] || return 0
+    # Whole or not at all, also for a run beside this one.
+    local fresh=$folder/.$$.$name
+    ffmpeg -nostdin -y -loglevel error "$@" -metadata creation_time=2026-01-31T12:00:00Z "$fresh" \
+      && mv "$fresh" "$folder/$name"
   }
   # High definition is Rec. 709, and says so.
   local hd='testsrc2=size=1920x1080:rate=25:duration=2,scale=out_color_matrix=bt709:out_range=tv,setparams=colorspace=bt709:color_primaries=bt709:color_trc=bt709'

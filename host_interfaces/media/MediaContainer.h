@@ -25,7 +25,8 @@ protected:
 };
 
 struct IMediaContainer2 : IMediaContainer {
-    // 8. A new mapping over the clip, which it shares with all others.
+    // 8. A new mapping over the clip, which it shares with all others: no two of
+    // them may deliver at once, see SampleMapping.h.
     virtual NCFRESULT GetSampleMapping(ISampleMapping** ppSampleMapping) = 0;
     virtual NCFRESULT ContainerUnsupportedB(void* a) = 0;  // 9
 

@@ -9,17 +9,21 @@
 // if the clip shows one, then the sound tracks, from zero. Samples count from
 // zero too. An operation that refuses answers NCF_E_NOTIMPL.
 //
-// Threads. A mapping locks itself, but all mappings of one clip share the clip's
-// readers, and nothing locks those across mappings. A host must not
-//   - deliver from two mappings of one clip on two threads at once, least of all in
-//     different formats: the reader's format may change between the moment at which
-//     a buffer is sized and the moment at which it is filled, and the frame is then
-//     written past the end of the buffer;
-//   - choose a format, Setup or Cleanup on one mapping of a clip while another
-//     delivers: this stops and starts the reader that both use. After a Cleanup
-//     each of them needs a Setup.
-// Two mappings of one clip take turns under a lock of the host's. A host that wants
-// frames on several threads opens a container on each: containers share nothing.
+// Threads. A mapping locks itself, but all mappings of one clip share the clip, its
+// parameters and its readers, and nothing locks those across mappings. Before one
+// thread has left a mapping of a clip, a host must not, on another,
+//   - deliver from a second one, least of all in another format: the reader's format
+//     may change between the moment at which a buffer is sized and the moment at
+//     which it is filled, and the frame is then written past the end of the buffer;
+//   - choose a format, Setup or Cleanup on a second one: this stops and starts the
+//     reader that both use. After a Cleanup each of them needs a Setup;
+//   - query a second one for its picture or sound formats: the first query makes the
+//     clip's readers, and reads its parameters;
+//   - set parameters through a second one: the first may be reading them.
+// So every call to the mappings of one clip comes under one lock of the host's. A
+// host that wants frames on several threads opens a container on each. Containers
+// share no clip and no reader; what the whole module shares, its log and the tables
+// of its data files, may be used from all of them at once.
 namespace NMA {
 
 // Delivers decoded samples in the formats that were chosen before.

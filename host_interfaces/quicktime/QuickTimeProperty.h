@@ -7,7 +7,7 @@
 
 namespace QuickTime {
 
-// Answers about the codec of a movie's picture.
+// Answers about the codec of a movie's picture. May be asked on several threads.
 struct IQuickTimeProperty : INCFUnknown {
     // 3. Opens the movie that the other operations speak of; may come again.
     virtual NCFRESULT CreateMovie(INCFString* path) = 0;

@@ -34,7 +34,7 @@ struct IQuickTimeWrapper : INCFUnknown {
                                                ncfBool* picture) = 0;
     virtual ncfBool MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) = 0;  // 13
     // 14. The one whose pictures the video reader delivers: the first of the file,
-    // or of the lowest number where the movie's header can't be read.
+    // or of the lowest number where no clip can be made of the movie's header.
     virtual ncfBool GetFirstVideoTrack(ncfUInt32* track) = 0;
     // 15. Fields in a frame, 1 or 2; false: unknown.
     virtual ncfBool GetFieldLayoutForTrack(ncfUInt32 track, ncfUInt32* fieldCount) = 0;

@@ -11,6 +11,11 @@ inline constexpr ncfUInt32 kUseDecompressionSession = 0;
 
 // Decodes pictures of the movie's first video track. Frame i is the i-th
 // presented picture in display order, edit list applied.
+//
+// One reader serves all mappings of a clip, one frame at a time: who wants a
+// frame sets its format, asks for its size and reads it, and nobody else may set
+// a format before that is done. ReadFrame is not told how much its destination
+// holds.
 struct IQTVideoReader : INCFUnknown {
     // 3. Code of the pixels that ReadFrame delivers. An unknown one is a
     // failure and the one before stays.
@@ -22,9 +27,13 @@ struct IQTVideoReader : INCFUnknown {
     // 5. Bytes of one picture in the format set; 0 without a format. The first
     // argument is 0xFFFFFFFF.
     virtual ncfUInt32 GetFrameBufferSize(ncfUInt32 all, ncfUInt64 sample, ncfUInt32) = 0;
-    virtual NCFRESULT InitQT(ncfUInt32 mode) = 0;          // 6. Again while started: NCF_OK
+    // 6. Again while started: NCF_OK.
+    virtual NCFRESULT InitQT(ncfUInt32 mode) = 0;
     virtual NCFRESULT ReservedVideoReaderOperation() = 0;  // 7
-    virtual NCFRESULT ReleaseQT() = 0;                     // 8. Again while released: NCF_OK
+    // 8. Gives decoder and kept pictures back; started again, the next ReadFrame
+    // makes them anew, and until then answers NMA_E_NOTINITIALIZED. Again while
+    // released: NCF_OK.
+    virtual NCFRESULT ReleaseQT() = 0;
 
 protected:
     ~IQTVideoReader() = default;
@@ -35,7 +44,8 @@ constexpr const GUID& ncfIdOf(const IQTVideoReader*) {
     return IID_IQTVideoReader;
 }
 
-// Delivers interleaved sound of any audio track, never resampled.
+// Delivers interleaved sound of any audio track, at the rate of its beginning: sound
+// that changes its rate or channels on the way is converted, nothing else is.
 struct IQTAudioReader : INCFUnknown {
     virtual NCFRESULT ReservedAudioReaderOperation() = 0;  // 3
     // 4. Form of the sound of one track; the channel count is written back.

@@ -10,9 +10,10 @@
 #include <fstream>
 #include <system_error>
 
+#include "host_interfaces/aaf/AAFResultCodes.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputFile.h"
-#include "reference_host/cliphost/UnfinishedFile.h"
+#include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -26,23 +27,40 @@ using PinTimeFunction = HRESULT (*)(const aafTimeStamp_t* time, const aafUID_t* 
 
 constexpr aafUID_t kPinnedGeneration = ncfGuid("00000000-0000-0000-0000-000000000001");
 
-// The file takes its place by its name, so a folder there would stand in the way.
-void CheckPlace(const std::filesystem::path& path) {
-    std::error_code error;
-    const auto there = std::filesystem::status(path, error);
-    if (there.type() == std::filesystem::file_type::none) {
-        throw Failure(kExitCaller, path, "not saved: " + error.message());
+// The last sentence that the library says for a person, while this lives.
+class LibrarySentence final : public IAAFDiagnosticOutput {
+public:
+    explicit LibrarySentence(AAFSetDiagnosticOutputFunction set) : set_(set) {
+        if (set_) {
+            set_(this);
+        }
     }
-    if (std::filesystem::is_directory(there)) {
-        throw Failure(kExitCaller, path, "not saved: a folder is there", "name another file");
+    ~LibrarySentence() {
+        if (set_) {
+            set_(nullptr);
+        }
     }
-    const std::filesystem::path folder = std::filesystem::absolute(path, error).parent_path();
-    if (!std::filesystem::is_directory(folder, error)) {
-        throw Failure(kExitCaller, path,
-                      fmt::format("not saved: there is no folder {}", DisplayPath(folder)),
-                      "make it first");
+    LibrarySentence(const LibrarySentence&) = delete;
+    LibrarySentence& operator=(const LibrarySentence&) = delete;
+
+    HRESULT QueryInterface(REFIID, void** out) override {
+        *out = nullptr;
+        return AAFRESULT_NOT_IMPLEMENTED;
     }
-}
+    // It lives longer than it is set.
+    ULONG AddRef() override { return 1; }
+    ULONG Release() override { return 1; }
+    HRESULT PutString(aafCharacter_constptr sentence) override {
+        text_ = Utf8(sentence);
+        return AAFRESULT_SUCCESS;
+    }
+
+    const std::string& text() const { return text_; }
+
+private:
+    AAFSetDiagnosticOutputFunction set_;
+    std::string text_;
+};
 
 // A folder of our own, gone with what is in it.
 class ScratchFolder {
@@ -133,32 +151,30 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     identification.platform = platform;
     identification.productVersion = &productVersion;
 
+    OutputFile output(path);
+    const LibrarySentence said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
     const auto check = [&](HRESULT result, const char* step) {
-        if (result < 0) {
-            const std::string reason = TextOfResult(result);
-            throw Failure(
-                kExitCaller, path,
-                fmt::format("not saved: {} failed: {}", step,
-                            reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result))
-                                           : reason));
+        if (result >= 0) {
+            return;
         }
+        if (const int error = SystemErrorIn(said.text())) {
+            output.Fail(error);
+        }
+        const std::string reason = said.text().empty() ? TextOfResult(result) : said.text();
+        throw Failure(
+            kExitCaller, path,
+            fmt::format(
+                "not written: {} failed: {}", step,
+                reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result)) : reason));
     };
-    CheckPlace(path);
-    // A library may refuse to open over a file that exists.
-    UnfinishedFile fresh(path);
-    std::error_code error;
-    std::filesystem::remove(fresh.path(), error);
     AafRef<IAAFFile> copy;
-    check(openNew(Wide(fresh.path().native()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
+    check(openNew(Wide(output.LeaveToOther().native()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
                   &identification, copy.Out()),
           "opening a new file");
     check(file->SaveCopyAs(copy.get()), "copying the description");
     check(copy->Save(), "saving");
     check(copy->Close(), "closing");
-    fresh.TakePlace(error);
-    if (error) {
-        throw Failure(kExitCaller, path, "not saved: " + error.message());
-    }
+    output.Finish();
 }
 
 AafRef<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {

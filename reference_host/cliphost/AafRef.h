@@ -50,8 +50,10 @@ AafRef<T> As(IUnknown* object) {
     AafRef<T> found;
     if (object) {
         void* raw = nullptr;
-        if (object->QueryInterface(aafIdOf(static_cast<T*>(nullptr)), &raw) >= 0) {
-            *found.Out() = static_cast<T*>(raw);
+        const HRESULT result = object->QueryInterface(aafIdOf(static_cast<T*>(nullptr)), &raw);
+        *found.Out() = static_cast<T*>(raw);
+        if (result < 0) {
+            found.Reset();  // what a failed query leaves is the asker's all the same
         }
     }
     return found;

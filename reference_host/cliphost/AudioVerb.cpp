@@ -50,8 +50,9 @@ std::uint64_t WantedCount(const AudioOptions& options, const SoundReader& sound)
 // none of it is written where nothing does.
 class SoundCopy {
 public:
-    SoundCopy(SoundReader& sound, const std::vector<unsigned char>& header, OutputFile& output)
-        : sound_(sound), header_(header), output_(output) {}
+    SoundCopy(SoundReader& sound, const MissingSound& missing,
+              const std::vector<unsigned char>& header, OutputFile& output)
+        : sound_(sound), missing_(missing), header_(header), output_(output) {}
 
     // Returns the number of samples that are silence, which may be all.
     std::uint64_t Run(std::uint64_t start, std::uint64_t count);
@@ -60,6 +61,7 @@ private:
     void Write(const SoundReader::Block& block);
 
     SoundReader& sound_;
+    const MissingSound& missing_;
     const std::vector<unsigned char>& header_;
     OutputFile& output_;
     bool isBegun_ = false;
@@ -73,7 +75,8 @@ std::uint64_t SoundCopy::Run(std::uint64_t start, std::uint64_t count) {
         progress.Step(fmt::format("{} of {} samples", done, count));
         const std::uint64_t now = std::min(kBlock, count - done);
         const SoundReader::Block block = sound_.Read(start + done, now);
-        silent += block.isSilence ? now : 0;
+        // The module tells of a block of which nothing could be read, and of no part.
+        silent += block.isSilence ? now : missing_.CountIn(start + done, start + done + now);
         Write(block);
     }
     return silent;
@@ -103,12 +106,17 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     const std::uint64_t count = WantedCount(options, sound);
     WavForm form = sound.form();
     if (form.rate == 0) {
+        const SoundAlone alone = essence.SoundOf(track);
+        if (alone.problem) {
+            throw Failure(kExitFile, alone.problem);
+        }
+        if (options.rate == 0) {
+            throw Failure(kExitFile, options.movie,
+                          "its samples a second are not known, since the movie can't be described",
+                          alone.rate == 0 ? "give --rate, their number"
+                                          : fmt::format("give --rate {}", alone.rate));
+        }
         form.rate = options.rate;
-    }
-    if (form.rate == 0) {
-        throw Failure(kExitCaller, options.movie,
-                      "its samples a second are not known, since the movie can't be described",
-                      "give --rate, such as --rate 48000");
     }
     const std::vector<unsigned char> header = WavHeader(form, count);
     if (header.empty()) {
@@ -117,10 +125,11 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
                                   Counted(form.channels, "channel"), form.rate));
     }
     RefuseOutputOntoMovie(options.output, options.movie);
+    const MissingSound missing = essence.MissingPart(track, form.rate);
     std::uint64_t silent = 0;
     try {
         OutputFile output(options.output);
-        silent = SoundCopy(sound, header, output).Run(options.start, count);
+        silent = SoundCopy(sound, missing, header, output).Run(options.start, count);
         if (silent == count) {
             essence.FailSamples(
                 track,
@@ -140,8 +149,9 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
                    Counted(count, "sample"), Counted(form.channels, "channel"), form.rate);
     }
     if (silent > 0) {
-        Notice("cliphost: {}: silence stands in place of {} of {}, which could not be read\n",
-               DisplayPath(options.movie), silent, Counted(count, "sample"));
+        Notice("cliphost: {}: {}silence stands in place of {} of {}, which could not be read\n",
+               DisplayPath(options.movie), missing.Reason().empty() ? "" : missing.Reason() + "; ",
+               silent, Counted(count, "sample"));
     }
     return silent == 0 ? kExitFine : kExitFile;
 }

@@ -66,9 +66,7 @@ const char* NameOf(TrackKind kind) {
 }
 
 std::string RateText(const ClipTrack& track) {
-    return track.RateAsNumber() > 0.0
-               ? fmt::format("{}/{}", track.rate.numerator, track.rate.denominator)
-               : "unknown";
+    return fmt::format("{}/{}", track.rate.numerator, track.rate.denominator);
 }
 
 std::string RateWords(const ClipTrack& track) {

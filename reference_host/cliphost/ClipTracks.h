@@ -27,7 +27,7 @@ struct ClipTrack {
     }
 };
 
-// "30000/1001", or "unknown".
+// "30000/1001", for a track whose rate is known.
 std::string RateText(const ClipTrack& track);
 // "25 frames a second", "48000 samples a second", or that this is not known.
 std::string RateWords(const ClipTrack& track);

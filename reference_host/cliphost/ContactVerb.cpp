@@ -62,8 +62,11 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
         alpha = std::make_unique<FrameReader>(essence, *shown, "");
     }
     const auto frames = SpreadFrames(reader.Count(), static_cast<std::uint64_t>(options.frames));
-    if (frames.empty() || reader.width() == 0) {
-        throw Failure(kExitFile, options.movie, "it has no frames");
+    if (frames.empty()) {
+        throw Failure(kExitFile, essence.WhyUnread(track, 0, NMA_E_NODATA));
+    }
+    if (reader.width() == 0) {
+        throw Failure(kExitFile, options.movie, "its pictures have no size");
     }
     const PictureTurn turn = options.turn.TurnFor(options.movie);
     ContactSheet sheet(static_cast<int>(frames.size()), options.columns, options.width,

@@ -7,6 +7,7 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/DataFiles.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
+#include "reference_host/quicktime/OpenProblem.h"
 
 namespace cliphost {
 namespace {
@@ -17,6 +18,9 @@ void Finish(Session& session, Description& description) {
         description.problem = ProblemWith(session, description.movie, description.result);
     } else {
         session.TakeNotices();
+        if (host::NeedsRasterCheck(description.movie)) {
+            description.doubt = WrongRaster(description.movie);
+        }
     }
 }
 
@@ -29,6 +33,7 @@ Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRES
         const std::string way = problem.route;
         // The module reads its data files at the first picture of a clip that loads.
         problem = DataFileProblem(session);
+        problem.isOfProgram = true;
         if (!problem) {
             problem = {movie, "the module makes no description of it, and no more is known of why",
                        "-vv shows what it logs"};

@@ -17,6 +17,7 @@ struct Description {
     AafRef<IAAFFile> file;  // empty on failure
     NCFRESULT result = NCF_OK;
     Problem problem;  // names the movie
+    Problem doubt;    // what the header tells wrong; it is described all the same
 };
 
 // Opens a movie through the module's container and lets it be described.

@@ -11,11 +11,11 @@
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
-#include "reference_host/cliphost/MovieDiagnosis.h"
-#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -31,14 +31,6 @@ struct DescribeOptions {
     bool json = false;
     bool quiet = false;
 };
-
-void TellRoute(const std::filesystem::path& movie) {
-    const RouteTaken taken = RouteOf(movie);
-    if (!taken.reason.empty()) {
-        Notice("{}: read by the multimedia library, since the header parser refuses it: {}\n",
-               DisplayPath(movie), taken.reason);
-    }
-}
 
 // Describes all that the command line names; one bad movie stops nothing.
 class DescribeRun {
@@ -67,13 +59,9 @@ private:
 };
 
 int DescribeRun::Run() {
+    std::optional<OutputFolder> folder;
     if (!options_.outFolder.empty()) {
-        std::error_code error;
-        std::filesystem::create_directories(options_.outFolder, error);
-        if (error) {
-            throw Failure(kExitCaller, options_.outFolder,
-                          "the folder can't be made: " + error.message());
-        }
+        folder.emplace(options_.outFolder);
     }
     for (const std::filesystem::path& path : options_.paths) {
         std::error_code ignored;
@@ -118,6 +106,9 @@ void DescribeRun::DescribeFolder(const std::filesystem::path& folder) {
     for (const std::filesystem::path& name : clips.others().withBackslash) {
         Refuse(name, BackslashProblem(name), kExitCaller);
     }
+    for (const Problem& problem : clips.others().noFiles) {
+        Refuse(problem.subject, problem, kExitCaller);
+    }
     if (const Problem leftOut = LeftOut(folder, clips.others())) {
         TellProblem(leftOut, session_.verbosity());
     }
@@ -135,6 +126,9 @@ void DescribeRun::Take(const Description& description) {
         Refuse(description.movie, description.problem, StatusOf(description.problem));
         return;
     }
+    if (description.doubt) {
+        TellProblem(description.doubt, session_.verbosity());
+    }
     std::filesystem::path saved;
     AafRef<IAAFFile> shown = description.file;
     if (!options_.aafFile.empty() || !options_.outFolder.empty()) {
@@ -149,9 +143,7 @@ void DescribeRun::Take(const Description& description) {
         shown = isDevice ? shown : session_.aaf().Open(saved);
     }
     ++described_;
-    if (session_.verbosity() > 0) {
-        TellRoute(description.movie);
-    }
+    TellRoute(description.movie, session_.verbosity());
     if (OutputFile::IsStandardOutput(saved)) {
         return;  // what is shown would be in the midst of the file
     }
@@ -161,11 +153,7 @@ void DescribeRun::Take(const Description& description) {
         if (!saved.empty()) {
             entry["aaf"] = MachinePath(saved);
         }
-        const RouteTaken taken = RouteOf(description.movie);
-        entry["route"] = taken.route;
-        if (!taken.reason.empty()) {
-            entry["routeReason"] = taken.reason;
-        }
+        AddRoute(description.movie, entry);
         entry["description"] = nlohmann::ordered_json::parse(ToJson(tree));
         json_.push_back(std::move(entry));
         return;
@@ -211,17 +199,21 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                      "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
                      "same movie gives the same bytes");
     verb->callback([&session, &status, options, pinned] {
-        if (!options->aafFile.empty() &&
-            (options->paths.size() != 1 || std::filesystem::is_directory(options->paths[0]))) {
-            throw Failure(kExitCaller, "--aaf", "it takes one movie", "use --out-dir for several");
-        }
-        if (options->json && OutputFile::IsStandardOutput(options->aafFile)) {
-            throw Failure(kExitCaller, "--aaf", "standard output takes the JSON", "name a file");
-        }
-        SessionOptions withTime = session;
-        withTime.pinTime = *pinned;
-        Session running(withTime);
-        status = DescribeRun(running, *options).Run();
+        AnswerFailureToo(options->json, nlohmann::ordered_json::array(), [&] {
+            if (!options->aafFile.empty() &&
+                (options->paths.size() != 1 || std::filesystem::is_directory(options->paths[0]))) {
+                throw Failure(kExitCaller, "--aaf", "it takes one movie",
+                              "use --out-dir for several");
+            }
+            if (options->json && OutputFile::IsStandardOutput(options->aafFile)) {
+                throw Failure(kExitCaller, "--aaf", "standard output takes the JSON",
+                              "name a file");
+            }
+            SessionOptions withTime = session;
+            withTime.pinTime = *pinned;
+            Session running(withTime);
+            status = DescribeRun(running, *options).Run();
+        });
     });
 }
 

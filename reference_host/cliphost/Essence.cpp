@@ -8,26 +8,13 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
 namespace {
 
 using host::DisplayPath;
-
-// Asks the mapping for another interface. A failed preparation leaves a pointer
-// behind that is the asker's to release.
-template <class Interface>
-NCFRESULT Ask(NMA::ISampleMapping* map, host::Ref<Interface>& out) {
-    void* found = nullptr;
-    const NCFRESULT result =
-        map->QueryInterface(ncfIdOf(static_cast<const Interface*>(nullptr)), &found);
-    out = host::Ref<Interface>::Adopt(static_cast<Interface*>(found));
-    if (result < 0) {
-        out.Reset();
-    }
-    return result;
-}
 
 }  // namespace
 
@@ -49,7 +36,7 @@ Essence::Essence(Session& session, std::filesystem::path movie, const ParameterO
 // The description says better what is wrong with a file, where it failed too.
 void Essence::Map(NMA::IMediaContainer3& container) {
     const NCFRESULT mapped = container.GetSampleMapping(map_.Out());
-    const NCFRESULT provided = mapped < 0 ? mapped : Ask(map_.get(), provider_);
+    const NCFRESULT provided = mapped < 0 ? mapped : host::Query(map_.get(), provider_);
     if (provided < 0) {
         throw Failure(undescribed_ ? undescribed_ : ProblemWith(session_, movie_, provided));
     }
@@ -59,8 +46,8 @@ void Essence::Map(NMA::IMediaContainer3& container) {
 // takes their numbers.
 std::vector<ClipTrack> Essence::FindTracks() {
     std::vector<ClipTrack> tracks;
-    Ask(map_.get(), pictures_);
-    Ask(map_.get(), sounds_);
+    host::Query(map_.get(), pictures_);
+    host::Query(map_.get(), sounds_);
     for (;;) {
         ClipTrack track;
         track.number = static_cast<ncfUInt32>(tracks.size());
@@ -89,7 +76,7 @@ std::vector<ClipTrack> Essence::FindTracks() {
 
 NMA::IUncompressedImageProvider& Essence::pictures() {
     if (!pictures_) {
-        const NCFRESULT result = Ask(map_.get(), pictures_);
+        const NCFRESULT result = host::Query(map_.get(), pictures_);
         if (result < 0) {
             Fail("no picture formats", result);
         }
@@ -99,7 +86,7 @@ NMA::IUncompressedImageProvider& Essence::pictures() {
 
 NMA::IUncompressedAudioProvider& Essence::sounds() {
     if (!sounds_) {
-        const NCFRESULT result = Ask(map_.get(), sounds_);
+        const NCFRESULT result = host::Query(map_.get(), sounds_);
         if (result < 0) {
             Fail("no sound reader", result);
         }
@@ -140,7 +127,8 @@ const ClipTrack& Essence::Track(std::optional<ncfUInt32> number, TrackKind kind)
 std::string Essence::TrackList() const {
     std::string list;
     for (const ClipTrack& track : tracks_) {
-        list += fmt::format("{}{} {}", list.empty() ? "" : ", ", track.number, NameOf(track.kind));
+        list +=
+            fmt::format("{}{} ({})", list.empty() ? "" : ", ", track.number, NameOf(track.kind));
     }
     return tracks_.empty()       ? "it has no tracks"
            : tracks_.size() == 1 ? "its one track is " + list
@@ -173,9 +161,12 @@ Problem Essence::Obstacle(const ClipTrack& track) {
 }
 
 void Essence::NeedDelivery(const ClipTrack& track) {
-    const Problem obstacle = Obstacle(track);
-    if (obstacle) {
+    if (const Problem obstacle = Obstacle(track)) {
         throw Failure(kExitFile, obstacle);
+    }
+    // The library would read what lies at the same place of this file.
+    if (!WhatLiesElsewhere(movie_, Which(track)).empty()) {
+        FailSamples(track, {}, NCF_E_FAIL);
     }
 }
 
@@ -198,9 +189,18 @@ Problem Essence::WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESU
     problem.subject = movie_;
     problem.code = result;
     if (!problem) {
-        problem.reason = "it can't be decoded";
+        problem.reason =
+            result == NMA_E_NODATA ? WhyNotShown(movie_, Which(track)) : "it can't be decoded";
     }
     return problem;
+}
+
+SoundAlone Essence::SoundOf(const ClipTrack& track) const {
+    return SoundWithoutDescription(movie_, Which(track).place);
+}
+
+bool Essence::LacksPictures() const {
+    return !WhatPictureLacks(movie_, 0).empty();
 }
 
 // The alpha is part of the picture.
@@ -219,6 +219,8 @@ Essence OpenEssence(Session& session, const std::filesystem::path& movie,
     if (essence.undescribed()) {
         TellProblem(essence.undescribed(), session.verbosity());
         Notice("  what can be mapped is served all the same\n");
+    } else {
+        TellRoute(movie, session.verbosity());
     }
     return essence;
 }

@@ -10,6 +10,7 @@
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
+#include "reference_host/cliphost/MissingMedia.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Problem.h"
@@ -45,12 +46,15 @@ public:
     const ClipTrack& Track(std::optional<ncfUInt32> number, TrackKind kind) const;
     const ClipTrack* First(TrackKind kind) const;
 
+    // Which one of the file's tracks of its kind it is.
+    WhichTrack Which(const ClipTrack& track) const;
+
     // All tracks by number and kind, for people.
     std::string TrackList() const;
 
     // Why nothing of a track can be delivered; nothing when it can.
     Problem Obstacle(const ClipTrack& track);
-    // Throws a Failure with the obstacle.
+    // Throws a Failure with the obstacle, also where the track lies in another file.
     void NeedDelivery(const ClipTrack& track);
 
     // Throws a Failure for a step that the module refused.
@@ -63,10 +67,19 @@ public:
     // decoder could tell.
     Problem WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESULT result) const;
 
+    // The part of a sound track that the file is too short for, by the samples a
+    // second that are delivered.
+    MissingSound MissingPart(const ClipTrack& track, unsigned rate) const {
+        return {movie_, Which(track).place, rate};
+    }
+    // What is known of the sound of a movie without description.
+    SoundAlone SoundOf(const ClipTrack& track) const;
+    // Whether the file is too short for some of its pictures.
+    bool LacksPictures() const;
+
 private:
     void Map(NMA::IMediaContainer3& container);
     std::vector<ClipTrack> FindTracks();
-    WhichTrack Which(const ClipTrack& track) const;
 
     Session& session_;
     std::filesystem::path movie_;

@@ -10,7 +10,8 @@ int StatusOf(const Problem& problem) {
     std::error_code ignored;
     const bool canBeRead = std::filesystem::is_regular_file(problem.subject, ignored) &&
                            access(problem.subject.c_str(), R_OK) == 0;
-    return problem.subject.empty() || canBeRead ? kExitFile : kExitCaller;
+    const bool isOfFile = problem.subject.empty() || canBeRead;
+    return isOfFile && !problem.isOfProgram ? kExitFile : kExitCaller;
 }
 
 }  // namespace cliphost

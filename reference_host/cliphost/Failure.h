@@ -17,8 +17,8 @@ inline constexpr int kExitFile = 1;    // the file's fault
 inline constexpr int kExitCaller = 2;  // the caller's fault
 
 // Whose fault a problem with a file is: the caller's where the system does not
-// open it, such as for want of permission, and where it is no file at all; else
-// that of what it holds.
+// open it, such as for want of permission, where it is no file at all, and where
+// it belongs to the program; else that of what it holds.
 int StatusOf(const Problem& problem);
 
 // Ends a verb with what the user and programs are told. what() is the line.

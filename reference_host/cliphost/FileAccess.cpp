@@ -73,6 +73,13 @@ Problem OutOfReach(const std::filesystem::path& path, int error) {
     return {path, SystemText(error)};
 }
 
+const char* KindOf(mode_t mode) {
+    return S_ISFIFO(mode)   ? "a pipe"
+           : S_ISSOCK(mode) ? "a socket"
+           : S_ISBLK(mode)  ? "a device of blocks"
+                            : "a device of characters";
+}
+
 }  // namespace
 
 Problem WhyUnreachable(const std::filesystem::path& path) {
@@ -90,8 +97,8 @@ Problem WhyUnreadable(const std::filesystem::path& file) {
     }
     // A pipe would keep us waiting.
     if (!S_ISREG(info.st_mode)) {
-        return {file, "this is no file but a pipe or device",
-                "copy what comes from it into a file"};
+        return {file, fmt::format("this is no file but {}", KindOf(info.st_mode)),
+                S_ISSOCK(info.st_mode) ? "" : "copy what comes from it into a file"};
     }
     const int descriptor = open(file.c_str(), O_RDONLY | O_CLOEXEC);
     if (descriptor < 0) {

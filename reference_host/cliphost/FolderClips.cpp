@@ -56,10 +56,13 @@ bool HasMovieEnding(const std::filesystem::path& name) {
 // A name for the movie that the module claims and that is not taken.
 std::filesystem::path ClaimedName(const std::filesystem::path& movie) {
     std::error_code ignored;
-    std::filesystem::path name = movie;
+    std::string plain = movie.filename().native();
+    std::replace(plain.begin(), plain.end(), '\\', '_');
+    const std::filesystem::path folder = movie.parent_path();
+    std::filesystem::path name = folder / plain;
     name.replace_extension(kClaimedEnding);
     if (std::filesystem::exists(name, ignored)) {
-        name = movie;
+        name = folder / plain;
         name += kClaimedEnding;
     }
     return name.filename();
@@ -74,10 +77,14 @@ std::string NamesOf(const std::vector<std::filesystem::path>& movies) {
 }
 
 std::string HowToName(const std::vector<std::filesystem::path>& movies) {
-    return fmt::format(
-        "rename {} so that the name ends in .mov, in small letters, such as {}; or give the file "
-        "itself to `cliphost describe`",
-        movies.size() == 1 ? "it" : "each", host::DisplayPath(ClaimedName(movies[0])));
+    const auto holdsBackslash = [](const std::filesystem::path& movie) {
+        return host::text::HoldsBackslash(movie.filename());
+    };
+    const bool canBeGiven = std::none_of(movies.begin(), movies.end(), holdsBackslash);
+    return fmt::format("rename {} so that the name ends in .mov, in small letters, such as {}{}",
+                       movies.size() == 1 ? "it" : "each",
+                       host::DisplayPath(ClaimedName(movies[0])),
+                       canBeGiven ? "; or give the file itself to `cliphost describe`" : "");
 }
 
 }  // namespace
@@ -92,7 +99,13 @@ OtherMovies FindOtherMovies(const std::filesystem::path& folder) {
     for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error)) {
         const std::filesystem::path name = entry->path().filename();
         std::error_code ignored;
-        if (!HasMovieEnding(name) || !entry->is_regular_file(ignored)) {
+        if (!HasMovieEnding(name) || entry->is_directory(ignored)) {
+            continue;
+        }
+        if (!entry->is_regular_file(ignored)) {
+            if (Problem problem = WhyUnreadable(entry->path())) {
+                others.noFiles.push_back(std::move(problem));
+            }
             continue;
         }
         if (name.extension() != kClaimedEnding) {
@@ -106,11 +119,22 @@ OtherMovies FindOtherMovies(const std::filesystem::path& folder) {
     }
     std::sort(others.otherEnding.begin(), others.otherEnding.end());
     std::sort(others.withBackslash.begin(), others.withBackslash.end());
+    std::sort(others.noFiles.begin(), others.noFiles.end(),
+              [](const Problem& a, const Problem& b) { return a.subject < b.subject; });
     return others;
 }
 
 Problem NotClaimed(const std::filesystem::path& folder) {
-    const std::vector<std::filesystem::path> movies = FindOtherMovies(folder).otherEnding;
+    const OtherMovies others = FindOtherMovies(folder);
+    const std::vector<std::filesystem::path>& movies = others.otherEnding;
+    for (const Problem& one : others.noFiles) {
+        if (movies.empty()) {
+            return {folder,
+                    fmt::format("not claimed: {}: {}", host::DisplayPath(one.subject.filename()),
+                                one.reason),
+                    one.hint};
+        }
+    }
     if (movies.empty()) {
         return {folder, "not claimed: no file there is named *.mov", {}};
     }

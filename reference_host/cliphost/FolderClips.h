@@ -23,6 +23,9 @@ struct OtherMovies {
     std::vector<std::filesystem::path> otherEnding;
     // They can't be named to the module.
     std::vector<std::filesystem::path> withBackslash;
+    // They lead to no file: links that end nowhere, pipes and the like, each with
+    // the reason.
+    std::vector<Problem> noFiles;
 };
 // Throws a Failure for a folder that can't be read.
 OtherMovies FindOtherMovies(const std::filesystem::path& folder);

@@ -7,6 +7,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
@@ -97,7 +98,7 @@ Json FormatsOf(Essence& essence) {
         Json json = {{"track", track.number},
                      {"kind", NameOf(track.kind)},
                      {"length", track.length},
-                     {"rate", RateText(track)}};
+                     {"rate", track.RateAsNumber() > 0.0 ? Json(RateText(track)) : Json()}};
         if (const Problem obstacle = essence.Obstacle(track)) {
             AddProblem(obstacle, json);
         } else if (track.kind == TrackKind::Sound) {
@@ -149,7 +150,14 @@ void PrintTrack(const ClipTrack& facts, const Json& track) {
 void Show(Essence& essence, bool json) {
     const Json list = FormatsOf(essence);
     if (json) {
-        PrintJson({{"movie", MachinePath(essence.movie())}, {"tracks", list}});
+        Json answer = {{"movie", MachinePath(essence.movie())}};
+        if (essence.undescribed()) {
+            AddProblem(essence.undescribed(), answer);
+        } else {
+            AddRoute(essence.movie(), answer);
+        }
+        answer["tracks"] = list;
+        PrintJson(answer);
         return;
     }
     fmt::print("{}\n", host::DisplayPath(essence.movie()));

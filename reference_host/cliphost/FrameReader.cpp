@@ -14,6 +14,7 @@ namespace cliphost {
 
 FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::string& formatName)
     : essence_(essence), track_(track), request_(host::MakeRef<host::SampleRequest>()) {
+    essence_.NeedDelivery(track_);
     Choose(formatName);
     NMA::IUncompressedImageProvider& pictures = essence_.pictures();
     NCFRESULT result = pictures.SetWorkingImageFormat(track_.number, format_.index);
@@ -41,7 +42,8 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     frameBytes_ = size;
     result = essence_.provider().Setup(track_.number);
     if (result < 0) {
-        essence_.Fail(fmt::format("track {}: the reader does not start", track_.number), result);
+        essence_.FailSamples(
+            track_, fmt::format("track {}: the reader does not start", track_.number), result);
     }
 }
 
@@ -72,12 +74,13 @@ void FrameReader::Choose(const std::string& formatName) {
                   "it offers " + offered);
 }
 
+// Edits may show pictures twice, so only where there is one does the number of
+// samples end them: it is given for every frame that is asked for.
 std::uint64_t FrameReader::MostFrames() const {
     ncfUInt64 samples = 0;
-    if (essence_.map().GetNumberOfSamples(track_.number, &samples) < 0) {
-        samples = track_.length;
-    }
-    return std::min<std::uint64_t>(track_.length, samples);
+    const bool isOne =
+        essence_.map().GetNumberOfSamples(track_.number, &samples) >= 0 && samples <= 1;
+    return isOne ? std::min<std::uint64_t>(track_.length, samples) : track_.length;
 }
 
 std::uint64_t FrameReader::Count() {
@@ -85,14 +88,18 @@ std::uint64_t FrameReader::Count() {
         return *count_;
     }
     std::uint64_t count = MostFrames();
-    // Edits can leave fewer pictures than the length says. Where they end is
-    // found by asking for one in the middle of what is open.
-    if (count > 1 && Read(count - 1) == NMA_E_NODATA) {
+    // Edits can leave fewer pictures than the length says, which is nothing wrong;
+    // a file that is cut has fewer too, and those count. Where edits end is found
+    // by asking for a picture in the middle of what is open.
+    if (count > 1 && Read(count - 1) == NMA_E_NODATA && !essence_.LacksPictures()) {
         std::uint64_t there = 0;
         while (there + 1 < count) {
             const std::uint64_t middle = there + (count - there) / 2;
             (Read(middle) == NMA_E_NODATA ? count : there) = middle;
         }
+    }
+    if (count == 1 && Read(0) == NMA_E_NODATA) {
+        count = 0;
     }
     count_ = count;
     return count;

@@ -30,9 +30,8 @@ public:
     int height() const { return height_; }  // of a whole frame
     std::uint64_t frameBytes() const { return frameBytes_; }
 
-    // Frames of the clip, counted from zero. The length of a clip, the number of
-    // its samples and that of the pictures that its edits leave can all differ;
-    // this is the smallest. Decodes the last one to know.
+    // Frames of the clip, counted from zero: its length, or the pictures that its
+    // edits show where those are fewer. Decodes the last one to know.
     std::uint64_t Count();
     // No frame is at or behind this number.
     std::uint64_t MostFrames() const;

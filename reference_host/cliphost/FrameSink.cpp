@@ -6,6 +6,7 @@
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PixelsToPicture.h"
 #include "reference_host/cliphost/PngFile.h"
 #include "reference_host/cliphost/Words.h"
@@ -82,13 +83,7 @@ private:
 class FolderSink final : public FrameSink {
 public:
     FolderSink(std::filesystem::path folder, std::filesystem::path stem, const PictureTurn& turn)
-        : folder_(std::move(folder)), stem_(std::move(stem)), turn_(turn) {
-        std::error_code error;
-        std::filesystem::create_directories(folder_, error);
-        if (error) {
-            throw Failure(kExitCaller, folder_, "the folder can't be made: " + error.message());
-        }
-    }
+        : folder_(std::move(folder)), made_(folder_), stem_(std::move(stem)), turn_(turn) {}
 
     void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {
         std::filesystem::path name = stem_;
@@ -104,6 +99,7 @@ public:
 
 private:
     std::filesystem::path folder_;
+    OutputFolder made_;
     std::filesystem::path stem_;
     PictureTurn turn_;
     std::uint64_t frames_ = 0;

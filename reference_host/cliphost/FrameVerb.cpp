@@ -65,8 +65,7 @@ FrameRange FrameRun::WantedFrames() {
                          reader_.Read(range.first) != NMA_E_NODATA;
     const std::uint64_t count = isThere ? range.first + 1 : reader_.Count();
     if (count == 0) {
-        throw Failure(kExitFile, essence_.movie(),
-                      fmt::format("track {}: it has no frames", track_.number));
+        throw Failure(kExitFile, essence_.WhyUnread(track_, range.first, NMA_E_NODATA));
     }
     if (range.CountIn(count) == 0) {
         throw Failure(kExitCaller, essence_.movie(),

@@ -12,14 +12,15 @@ namespace cliphost {
 void PrintJson(const nlohmann::ordered_json& answer);
 
 // Does a verb's work. With `json`, a failure of it is told on standard output as
-// well: `head`, which names the movie or folder, and the problem.
+// well: `head`, which may name the movie or folder, and the problem. A verb that
+// answers with a list gives an empty one, which the problem goes into.
 template <class Work>
 void AnswerFailureToo(bool json, nlohmann::ordered_json head, const Work& work) {
     try {
         work();
     } catch (const Failure& failure) {
         if (json) {
-            AddProblem(failure.problem(), head);
+            AddProblem(failure.problem(), head.is_array() ? head.emplace_back() : head);
             PrintJson(head);
         }
         throw;

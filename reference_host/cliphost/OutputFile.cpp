@@ -13,6 +13,7 @@
 #include <utility>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OutputProblem.h"
 
 namespace cliphost {
 std::optional<int> OutputFile::DescriptorOf(const std::filesystem::path& path) {
@@ -67,6 +68,10 @@ OutputFile::OutputFile(std::filesystem::path path) : path_(std::move(path)) {
     if (std::filesystem::is_directory(status)) {
         Fail(EISDIR);
     }
+    // Another file would take the place of one that is closed to us.
+    if (std::filesystem::is_regular_file(status) && access(path_.c_str(), W_OK) != 0) {
+        Fail(errno);
+    }
     if (!std::filesystem::exists(status) || std::filesystem::is_regular_file(status)) {
         unfinished_.emplace(path_);
     }
@@ -105,7 +110,7 @@ void OutputFile::Write(const void* bytes, std::size_t size) {
 
 void OutputFile::Finish() {
     // Some systems tell of a full disk only here.
-    if (close(std::exchange(descriptor_, -1)) != 0) {
+    if (descriptor_ >= 0 && close(std::exchange(descriptor_, -1)) != 0) {
         Fail(errno);
     }
     if (unfinished_) {
@@ -117,10 +122,17 @@ void OutputFile::Finish() {
     }
 }
 
+const std::filesystem::path& OutputFile::LeaveToOther() {
+    std::error_code ignored;
+    close(std::exchange(descriptor_, -1));
+    std::filesystem::remove(unfinished_->path(), ignored);
+    return unfinished_->path();
+}
+
 void OutputFile::Fail(int error) {
     const bool isOwn = IsStandardOutput(path_);
-    throw Failure(kExitCaller, isOwn ? std::filesystem::path("standard output") : path_,
-                  "not written: " + std::generic_category().message(error));
+    throw Failure(kExitCaller,
+                  NotWritten(isOwn ? std::filesystem::path("standard output") : path_, error));
 }
 
 }  // namespace cliphost

@@ -31,6 +31,11 @@ public:
     // Throws a Failure that tells why, or ReaderGone.
     void Write(const void* bytes, std::size_t size);
     void Finish();  // throws a Failure
+    // Leaves the writing to somebody who makes a file of his own: the name that
+    // he is to give it, at which nothing is. Not for devices.
+    const std::filesystem::path& LeaveToOther();
+    // Throws the Failure for what the system said.
+    [[noreturn]] void Fail(int error);
 
     // The open descriptor that a path stands for: "-", "/dev/stdout", "/dev/fd/5".
     static std::optional<int> DescriptorOf(const std::filesystem::path& path);
@@ -41,8 +46,6 @@ public:
     static bool IsDevice(const std::filesystem::path& path);
 
 private:
-    [[noreturn]] void Fail(int error);
-
     std::filesystem::path path_;
     std::optional<UnfinishedFile> unfinished_;  // none: the place itself is written
     int descriptor_ = -1;

@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/parameters/ShownText.h"
@@ -86,9 +87,10 @@ void Print(ClipParameters& parameters, const ParamsOptions& options, const FileF
         }
         return;
     }
-    nlohmann::ordered_json json = {{"movie", MachinePath(options.movie)},
-                                   {"set", set},
-                                   {"parameters", nlohmann::ordered_json::array()}};
+    nlohmann::ordered_json json = {{"movie", MachinePath(options.movie)}};
+    AddRoute(options.movie, json);
+    json["set"] = set;
+    json["parameters"] = nlohmann::ordered_json::array();
     for (const ClipParameter& parameter : list) {
         json["parameters"].push_back(ToJson(parameter, file));
     }
@@ -124,6 +126,7 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
             if (description.problem && file.order.empty()) {
                 throw Failure(description.problem);
             }
+            TellRoute(options->movie, running.verbosity());
             ClipParameters parameters(running, options->movie, *container);
             options->parameters.ApplyTo(parameters);
             Print(parameters, *options, file);

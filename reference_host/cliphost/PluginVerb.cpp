@@ -67,12 +67,14 @@ void AddPlugin(CLI::App& app, const SessionOptions& options, int&) {
     auto json = std::make_shared<bool>(false);
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, json] {
-        const Session session(options);
-        if (*json) {
-            PrintJson(ToJson(session));
-        } else {
-            PrintText(session);
-        }
+        AnswerFailureToo(*json, nlohmann::ordered_json::object(), [&] {
+            const Session session(options);
+            if (*json) {
+                PrintJson(ToJson(session));
+            } else {
+                PrintText(session);
+            }
+        });
     });
 }
 

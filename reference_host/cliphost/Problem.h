@@ -24,6 +24,7 @@ struct Problem {
     std::string hint = {};               // what helps; empty where nothing does
     NCFRESULT code = NCF_OK;             // the module's answer; fine where it was not asked
     std::string route = {};              // empty where no movie was read
+    bool isOfProgram = false;            // of what belongs to the program, not of the movie
 
     explicit operator bool() const { return !reason.empty(); }
 };

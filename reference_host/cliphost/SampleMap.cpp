@@ -4,6 +4,8 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+
 namespace cliphost {
 namespace {
 
@@ -25,65 +27,138 @@ void Tell(RunMap& map, std::string fault) {
     }
 }
 
-NCFRESULT SizeOf(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t sample,
-                 std::uint64_t& size) {
-    ncfUInt64 answer = 0;  // the low half is written
-    const NCFRESULT result = map.GetSampleSize(track, sample, &answer);
-    size = answer;
+// Where a sample lies. Sound may have several samples in a packet, which have the
+// place of that.
+struct Stored {
+    std::uint64_t position = 0;
+    std::uint64_t size = 0;
+
+    bool SharesPacketWith(const Stored& other) const {
+        return size > 0 && size == other.size && position == other.position;
+    }
+};
+
+NCFRESULT ReadStored(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t sample,
+                     Stored& stored) {
+    ncfUInt64 size = 0;  // the low half is written
+    ncfUInt64 position = 0;
+    NCFRESULT result = map.GetSampleSize(track, sample, &size);
+    if (result >= 0) {
+        result = map.GetSamplePosition(track, sample, &position);
+    }
+    stored = {position, size};
     return result;
 }
 
-// Goes over samples until their sizes make up the run's bytes. Samples that all
-// have one size, as those of PCM, need not be asked one by one.
-NCFRESULT MeasureRun(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t samples,
-                     SampleRun& run, std::uint64_t& sum) {
-    std::uint64_t first = 0, last = 0;
-    NCFRESULT result = SizeOf(map, track, run.first, first);
-    if (result < 0) {
-        return result;
-    }
-    const std::uint64_t left = samples - run.first;
-    if (first > 0 && run.bytes % first == 0 && run.bytes / first <= left &&
-        SizeOf(map, track, run.first + run.bytes / first - 1, last) >= 0 && last == first) {
-        ncfUInt64 lastPosition = 0;
-        const std::uint64_t count = run.bytes / first;
-        result = map.GetSamplePosition(track, run.first + count - 1, &lastPosition);
-        if (result < 0) {
+// Goes over the samples of a run, which is the first of `samples` that are left to
+// measure, until their packets make up its bytes.
+class RunMeasure {
+public:
+    RunMeasure(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t samples, SampleRun& run)
+        : map_(map), track_(track), left_(samples - run.first), run_(run) {}
+
+    // `sum`: the bytes of the packets.
+    NCFRESULT Run(std::uint64_t& sum) {
+        NCFRESULT result = Read(0, first_);
+        bool isEven = false;
+        if (result >= 0) {
+            result = MeasureEvenPackets(isEven);
+        }
+        if (result < 0 || isEven) {
+            sum = run_.bytes;
             return result;
         }
-        if (lastPosition - run.position == (count - 1) * first) {
-            run.count = count;
-            sum = run.bytes;
+        return MeasureEachSample(sum);
+    }
+
+private:
+    NCFRESULT Read(std::uint64_t sample, Stored& stored) {
+        return ReadStored(map_, track_, run_.first + sample, stored);
+    }
+
+    // How many samples the first packet holds, in steps that grow and then halve.
+    NCFRESULT CountInFirstPacket(std::uint64_t& count) {
+        std::uint64_t inside = 0, outside = left_;
+        for (std::uint64_t step = 1; inside + 1 < outside;) {
+            const bool isGrowing = step > 0 && step < outside - inside;
+            const std::uint64_t at = isGrowing ? inside + step : inside + (outside - inside) / 2;
+            Stored stored;
+            const NCFRESULT result = Read(at, stored);
+            if (result < 0) {
+                return result;
+            }
+            const bool isInside = stored.SharesPacketWith(first_);
+            (isInside ? inside : outside) = at;
+            step = isGrowing && isInside ? step * 2 : 0;
+        }
+        count = inside + 1;
+        return NCF_OK;
+    }
+
+    // Packets that all have one size and hold equally many samples, as those of
+    // PCM, need not be asked one by one.
+    NCFRESULT MeasureEvenPackets(bool& isEven) {
+        if (first_.size == 0 || run_.bytes == 0 || run_.bytes % first_.size != 0) {
             return NCF_OK;
         }
-    }
-    sum = 0;
-    run.count = 0;
-    do {
-        std::uint64_t size = 0;
-        result = SizeOf(map, track, run.first + run.count, size);
-        if (result < 0) {
+        const std::uint64_t packets = run_.bytes / first_.size;
+        std::uint64_t inPacket = 1;
+        NCFRESULT result = CountInFirstPacket(inPacket);
+        if (result < 0 || packets - 1 > (left_ - 1) / inPacket) {
             return result;
         }
-        sum += size;
-        ++run.count;
-    } while (sum < run.bytes && run.count < left);
-    return NCF_OK;
-}
+        const std::uint64_t begin = (packets - 1) * inPacket;  // of the last packet
+        const std::uint64_t count = begin + std::min(inPacket, left_ - begin);
+        const Stored wanted{run_.position + (packets - 1) * first_.size, first_.size};
+        for (const std::uint64_t at : {begin, count - 1}) {
+            Stored stored;
+            result = Read(at, stored);
+            if (result < 0 || !stored.SharesPacketWith(wanted)) {
+                return result;
+            }
+        }
+        isEven = true;
+        run_.count = count;
+        return NCF_OK;
+    }
+
+    NCFRESULT MeasureEachSample(std::uint64_t& sum) {
+        Stored last = first_;
+        sum = first_.size;
+        for (run_.count = 1; run_.count < left_; ++run_.count) {
+            Stored stored;
+            const NCFRESULT result = Read(run_.count, stored);
+            if (result < 0) {
+                return result;
+            }
+            const bool isNew = !stored.SharesPacketWith(last);
+            if (isNew && sum >= run_.bytes) {
+                break;
+            }
+            sum += isNew ? stored.size : 0;
+            last = stored;
+        }
+        return NCF_OK;
+    }
+
+    NMA::ISampleMapping& map_;
+    ncfUInt32 track_;
+    std::uint64_t left_;
+    SampleRun& run_;
+    Stored first_;
+};
 
 }  // namespace
 
 NCFRESULT ReadMappedSample(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t number,
-                           MappedSample& sample) {
+                           MappedSample& sample, TemporalOffsets* offsets) {
     sample = {};
     sample.number = number;
-    ncfUInt64 position = 0, flags = 0, runBytes = 0;
+    ncfUInt64 flags = 0, runBytes = 0;
     ncfUInt32 dependencies = 0;
-    ncfSInt64 offset = 0, runSamples = 0;
-    NCFRESULT result = SizeOf(map, track, number, sample.size);
-    if (result >= 0) {
-        result = map.GetSamplePosition(track, number, &position);
-    }
+    ncfSInt64 runSamples = 0;
+    Stored stored;
+    NCFRESULT result = ReadStored(map, track, number, stored);
     if (result >= 0) {
         result = map.GetSampleProperties(track, number, &flags, &dependencies);
     }
@@ -96,14 +171,13 @@ NCFRESULT ReadMappedSample(NMA::ISampleMapping& map, ncfUInt32 track, std::uint6
     if (result < 0) {
         return result;
     }
-    sample.position = position;
+    sample.position = stored.position;
+    sample.size = stored.size;
     sample.properties = flags;
     sample.dependencies = dependencies;
     sample.contiguousSamples = runSamples;
     sample.contiguousBytes = runBytes;
-    if (map.GetSampleTemporalOffset(track, number, &offset) >= 0) {
-        sample.temporalOffset = offset;
-    }
+    sample.temporalOffset = offsets ? offsets->Of(number) : AskOffset(map, track, number);
     return NCF_OK;
 }
 
@@ -133,7 +207,7 @@ RunMap ReadRuns(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t fileSiz
         run.position = position;
         run.bytes = bytes;
         if (found.result >= 0) {
-            found.result = MeasureRun(map, track, found.samples, run, sum);
+            found.result = RunMeasure(map, track, found.samples, run).Run(sum);
         }
         if (found.result < 0) {
             break;

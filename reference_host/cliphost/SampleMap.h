@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "host_interfaces/media/SampleMapping.h"
+#include "reference_host/cliphost/TemporalOffsets.h"
 
 namespace cliphost {
 
@@ -24,9 +25,10 @@ struct MappedSample {
     std::int64_t contiguousSamples = 0;  // -1 is an answer too
     std::uint64_t contiguousBytes = 0;
 };
-// The result is the module's; a missing temporal offset is no failure.
+// The result is the module's; a missing temporal offset is no failure. Who reads all
+// samples of a track hands its `offsets` in.
 NCFRESULT ReadMappedSample(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t number,
-                           MappedSample& sample);
+                           MappedSample& sample, TemporalOffsets* offsets = nullptr);
 // "stands alone" and the like, the number itself when it is not known.
 std::string WordsForProperties(std::uint64_t properties);
 
@@ -40,7 +42,8 @@ struct SampleRun {
 
 // The runs of a track, with what was found wrong with them: every run must lie
 // inside the file, its bytes must be the sum of its samples' sizes, and the runs
-// must hold every sample once.
+// must hold every sample once. Samples at one place are those of one packet, whose
+// size each of them has.
 struct RunMap {
     std::uint64_t samples = 0;
     std::uint64_t bytes = 0;  // of all samples

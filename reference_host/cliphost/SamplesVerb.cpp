@@ -2,11 +2,14 @@
 // SPDX-License-Identifier: MIT
 #include <fmt/format.h>
 
+#include <algorithm>
+
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/SampleMap.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
@@ -40,13 +43,13 @@ private:
     void ShowTrack(const ClipTrack& track);
     void ShowSamples(const ClipTrack& track, std::uint64_t count, Json& json);
     void ShowRuns(const RunMap& runs, Json& json);
-    void ShowSums(const RunMap& runs, Json& json);
+    void ShowSums(const ClipTrack& track, const RunMap& runs, Json& json);
 
     Essence& essence_;
     const SamplesOptions& options_;
     std::uint64_t fileSize_ = 0;
     Json tracks_ = Json::array();
-    bool isSound_ = true;  // nothing wrong was found
+    Problem wrong_;  // the first thing of all that is
 };
 
 std::string OffsetText(const MappedSample& sample) {
@@ -74,12 +77,16 @@ void SamplesRun::ShowSamples(const ClipTrack& track, std::uint64_t count, Json& 
         fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", "sample", "position", "size",
                    "offset", "properties", "bytes that follow each other");
     }
+    TemporalOffsets offsets(essence_.map(), track.number, [&] {
+        return DisplayTimesOf(essence_.movie(), essence_.Which(track));
+    });
     for (std::uint64_t i = 0; i < count; ++i) {
         if (i % kStep == 0) {
             progress.Step(fmt::format("{}", i));
         }
         MappedSample sample;
-        const NCFRESULT result = ReadMappedSample(essence_.map(), track.number, i, sample);
+        const NCFRESULT result =
+            ReadMappedSample(essence_.map(), track.number, i, sample, &offsets);
         if (result < 0) {
             essence_.Fail(fmt::format("track {}: sample {} can't be mapped", track.number, i),
                           result);
@@ -111,8 +118,13 @@ void SamplesRun::ShowRuns(const RunMap& runs, Json& json) {
     }
 }
 
-void SamplesRun::ShowSums(const RunMap& runs, Json& json) {
-    isSound_ = isSound_ && runs.faults.empty();
+void SamplesRun::ShowSums(const ClipTrack& track, const RunMap& runs, Json& json) {
+    if (!wrong_ && !runs.faults.empty()) {
+        wrong_ = essence_.WhyUnread(track, std::max<std::uint64_t>(runs.samples, 1) - 1, NCF_OK);
+        const bool isKnown = !wrong_.hint.empty();
+        wrong_.reason = isKnown ? wrong_.reason
+                                : fmt::format("track {}: {}", track.number, runs.faults.front());
+    }
     if (options_.json) {
         json["bytes"] = runs.bytes;
         json["faults"] = runs.faults;
@@ -156,7 +168,7 @@ void SamplesRun::ShowTrack(const ClipTrack& track) {
     } else {
         ShowSamples(track, runs.samples, json);
     }
-    ShowSums(runs, json);
+    ShowSums(track, runs, json);
     tracks_.push_back(std::move(json));
 }
 
@@ -175,11 +187,19 @@ int SamplesRun::Run() {
                       essence_.TrackList());
     }
     if (options_.json) {
-        PrintJson({{"movie", MachinePath(options_.movie)},
-                   {"fileBytes", fileSize_},
-                   {"tracks", tracks_}});
+        Json answer = {{"movie", MachinePath(options_.movie)}, {"fileBytes", fileSize_}};
+        if (wrong_ || essence_.undescribed()) {
+            AddProblem(wrong_ ? wrong_ : essence_.undescribed(), answer);
+        } else {
+            AddRoute(options_.movie, answer);
+        }
+        answer["tracks"] = tracks_;
+        PrintJson(answer);
     }
-    return isSound_ ? kExitFine : kExitFile;
+    if (wrong_) {
+        TellProblem(wrong_, essence_.session().verbosity());
+    }
+    return wrong_ ? kExitFile : kExitFine;
 }
 
 }  // namespace

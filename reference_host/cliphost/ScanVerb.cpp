@@ -64,12 +64,17 @@ nlohmann::ordered_json ToJson(const FolderFacts& facts) {
         }
         return paths;
     };
+    std::vector<std::filesystem::path> noFiles;
+    for (const Problem& one : facts.others.noFiles) {
+        noFiles.push_back(one.subject);
+    }
     return {{"claimed", facts.claimed},
             {"name", facts.name},
             {"newest", facts.newest},
             {"movies", list(facts.movies)},
             {"otherEnding", list(facts.others.otherEnding)},
-            {"withBackslash", list(facts.others.withBackslash)}};
+            {"withBackslash", list(facts.others.withBackslash)},
+            {"noFiles", list(noFiles)}};
 }
 
 void Print(const FolderFacts& facts) {
@@ -99,9 +104,13 @@ int ShowFolder(Session& session, const std::filesystem::path& folder, bool json)
     for (const std::filesystem::path& movie : facts.others.withBackslash) {
         TellProblem(BackslashProblem(movie), session.verbosity());
     }
-    return !facts.claimed                       ? kExitFile
-           : facts.others.withBackslash.empty() ? kExitFine
-                                                : kExitCaller;
+    for (const Problem& one : facts.others.noFiles) {
+        if (facts.claimed) {
+            TellProblem(one, session.verbosity());
+        }
+    }
+    const bool allCanBeNamed = facts.others.withBackslash.empty() && facts.others.noFiles.empty();
+    return !facts.claimed ? kExitFile : allCanBeNamed ? kExitFine : kExitCaller;
 }
 
 }  // namespace

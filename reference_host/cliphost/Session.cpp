@@ -102,7 +102,9 @@ Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) 
     host::LoadFailure failure;
     plugin_ = host_->LoadModule(module, failure);
     if (!plugin_) {
-        throw Failure(kExitCaller, failure.message);
+        throw Failure(
+            kExitCaller,
+            Problem{{}, failure.message, "name another with --plugin FILE", failure.code});
     }
 }
 
@@ -118,7 +120,8 @@ std::vector<std::filesystem::path> Session::MissingDataFiles() const {
     std::vector<std::filesystem::path> missing;
     for (const char* const name : {"FourCharMapper.xml", "AAFInfo.xml"}) {
         const std::filesystem::path file = plugin_->file().parent_path() / name;
-        if (!std::filesystem::is_regular_file(file)) {
+        std::error_code ignored;
+        if (!std::filesystem::exists(std::filesystem::symlink_status(file, ignored))) {
             missing.push_back(file);
         }
     }

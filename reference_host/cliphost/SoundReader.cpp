@@ -47,8 +47,8 @@ void SoundReader::SetFormat() {
             }
         }
     }
-    essence_.Fail(fmt::format("track {}: no sound format can be set", track_.number),
-                  result < 0 ? result : NCF_E_NOTSUPPORTED);
+    essence_.FailSamples(track_, fmt::format("track {}: no sound format can be set", track_.number),
+                         result < 0 ? result : NCF_E_NOTSUPPORTED);
 }
 
 SoundReader::Block SoundReader::Read(std::uint64_t first, std::uint64_t count) {

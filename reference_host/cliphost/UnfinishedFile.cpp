@@ -9,6 +9,8 @@
 #include <climits>
 #include <csignal>
 #include <cstring>
+#include <functional>
+#include <string>
 
 namespace cliphost {
 namespace {
@@ -67,11 +69,21 @@ std::filesystem::path BehindLinks(std::filesystem::path path) {
     return path;
 }
 
+// The place's own name shows whose part it is. One that leaves no room for more
+// is told by a number; a writer may put a few letters behind this name again.
+std::filesystem::path NameBeside(const std::filesystem::path& place) {
+    constexpr std::size_t kRoom = 32;
+    const std::string name = place.filename().native();
+    const std::string stem = name.size() + kRoom <= NAME_MAX
+                                 ? name
+                                 : fmt::format("{:x}", std::hash<std::string>()(name));
+    return place.parent_path() / fmt::format("{}.{}.part", stem, getpid());
+}
+
 }  // namespace
 
 UnfinishedFile::UnfinishedFile(const std::filesystem::path& place)
-    : place_(BehindLinks(place)), path_(place_) {
-    path_ += fmt::format(".{}.part", getpid());
+    : place_(BehindLinks(place)), path_(NameBeside(place_)) {
     // Absolute, should the working folder change.
     std::error_code error;
     const std::filesystem::path absolute = std::filesystem::absolute(path_, error);

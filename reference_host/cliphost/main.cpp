@@ -6,6 +6,7 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <csignal>
 #include <cstdio>
 #include <iostream>
 #include <system_error>
@@ -14,6 +15,7 @@
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -45,7 +47,7 @@ int OutputStatus(int error, int status) {
     if (error == 0 || error == EPIPE) {
         return status;  // a reader that went away has seen enough
     }
-    Tell("standard output: not written: " + std::generic_category().message(error));
+    Tell(LineOf(cliphost::NotWritten("standard output", error)));
     return cliphost::kExitCaller;
 }
 
@@ -168,6 +170,8 @@ int Run(int argc, char** argv) {
 }  // namespace
 
 int main(int argc, char** argv) {
+    // A file that outgrows its limit fails to be written; the signal would end us.
+    std::signal(SIGXFSZ, SIG_IGN);
     KeepStandardStreams();
     return FlushOutput(Run(argc, argv));
 }

@@ -10,8 +10,8 @@ std::string PlainNameOf(ncfUInt32 type) {
     std::string name;
     for (int shift = 24; shift >= 0; shift -= 8) {
         const ncfUInt32 c = type >> shift & 0xFF;
-        name += c >= 0x20 && c < 0x7F ? std::string(1, static_cast<char>(c))
-                                      : fmt::format("\\x{:02X}", c);
+        const bool isPlain = c >= 0x20 && c < 0x7F && c != '\\';
+        name += isPlain ? std::string(1, static_cast<char>(c)) : fmt::format("\\x{:02X}", c);
     }
     return name;
 }

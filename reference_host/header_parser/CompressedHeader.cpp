@@ -59,9 +59,13 @@ Verdict Unpack(const ncfUInt8* from, ncfUInt64 count, ncfUInt64 limit, HeaderByt
         }
         if (result != Z_OK) {
             return Broken(
-                fmt::format("the compressed movie header can't be unpacked behind byte {} "
-                            "of {}",
-                            count - inflater.stream.avail_in, count));
+                inflater.stream.avail_in == 0
+                    ? fmt::format("the compressed movie header is cut short: its {} unpack to no "
+                                  "end",
+                                  Counted(count, "byte"))
+                    : fmt::format("the compressed movie header can't be unpacked behind byte {} "
+                                  "of {}",
+                                  count - inflater.stream.avail_in, count));
         }
     }
 }

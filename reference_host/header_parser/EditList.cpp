@@ -83,6 +83,25 @@ Verdict EditList::Read(const Atom& elst, const ParserLimits& limits) {
     return Fine();
 }
 
+ncfUInt64 EditList::Filled(ncfUInt64 mediaEnd, const Scales& scales) const {
+    const auto unitsBehind = [&](ncfSInt64 mediaTime) {
+        const auto start = static_cast<ncfUInt64>(mediaTime);
+        return mediaEnd > start ? MultiplyDivide(mediaEnd - start, scales.movie, scales.media) : 0;
+    };
+    if (duration_ == 0) {
+        return unitsBehind(Offset());
+    }
+    ncfUInt64 filled = 0;
+    for (const Edit& edit : edits_) {
+        const bool playsForward = edit.mediaTime >= 0 && edit.rate > 0;
+        filled += playsForward ? std::min(edit.duration,
+                                          MultiplyDivide(unitsBehind(edit.mediaTime), kNormalRate,
+                                                         static_cast<ncfUInt32>(edit.rate)))
+                               : edit.duration;
+    }
+    return filled;
+}
+
 // Several edits count as one where each goes on at the media time at which the
 // one before it ended, give or take the rounding of a movie unit.
 bool EditList::IsProportional(const Scales& scales) const {

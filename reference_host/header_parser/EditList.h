@@ -27,6 +27,11 @@ public:
     // Sum of the edits; 0 when the list leaves it open.
     ncfUInt64 Duration() const { return duration_; }
 
+    // Movie units that media of this end can fill: each edit as far as there is
+    // media behind its start, nothing for as long as it tells, and where the list
+    // leaves the length open, all behind its start.
+    ncfUInt64 Filled(ncfUInt64 mediaEnd, const Scales& scales) const;
+
     // The media plays once, straight through, at its own speed.
     bool IsLinear(const Scales& scales) const;
     // Track and media time advance in one proportion from end to end.

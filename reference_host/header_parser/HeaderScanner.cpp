@@ -50,7 +50,7 @@ Verdict At(ncfUInt64 position, Verdict verdict) {
 }
 
 Verdict TooLarge(ncfUInt64 size, const ParserLimits& limits) {
-    return TooMuch(fmt::format("the movie header is {} bytes long, at most {} are read", size,
+    return TooMuch(fmt::format("the movie header claims {} bytes, at most {} are read", size,
                                limits.maxHeaderBytes));
 }
 

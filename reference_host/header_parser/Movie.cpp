@@ -102,11 +102,16 @@ Verdict SetDuration(const MovieHeader& header, Movie& movie) {
             header.atom,
             fmt::format("the movie's duration of {} units does not fit 32 bits", *header.duration));
     }
-    movie.duration = static_cast<ncfUInt32>(header.duration.value_or(0));
-    if (!header.duration) {
-        for (const Track& track : movie.tracks) {
-            movie.duration = std::max(movie.duration, track.duration);
-        }
+    ncfUInt32 longest = 0;
+    bool isShorterThanTold = false;
+    for (const Track& track : movie.tracks) {
+        longest = std::max(longest, track.duration);
+        isShorterThanTold = isShorterThanTold || track.isShorterThanTold;
+    }
+    movie.duration = static_cast<ncfUInt32>(header.duration.value_or(longest));
+    // The header repeats what its longest track tells.
+    if (isShorterThanTold) {
+        movie.duration = std::min(movie.duration, longest);
     }
     return Fine();
 }

@@ -23,10 +23,12 @@ inline constexpr std::size_t kTrackKinds = 4;
 struct Track {
     TrackKind kind = TrackKind::kOther;
     ncfUInt32 id = 0;
-    ncfUInt32 duration = 0;  // movie time units
+    ncfUInt32 duration = 0;          // movie time units
+    bool isShorterThanTold = false;  // its headers and edits tell more than it can fill
     std::array<float, 9> matrix{};
     ncfUInt32 mediaTimeScale = 0;
     ncfUInt32 mediaDuration = 0;
+    ncfUInt32 toldMediaDuration = 0;  // by its header; 0 for nothing
     EditList edits;
     SampleTable samples;
 

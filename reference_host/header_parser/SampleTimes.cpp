@@ -156,6 +156,25 @@ ncfUInt32 SampleTimes::DurationOf(ncfUInt32 sample) const {
     return Duration(hasOneDuration_ ? 0 : DurationRunOf(sample).entry);
 }
 
+ncfUInt64 SampleTimes::DecodeTimeOf(ncfUInt32 sample) const {
+    const DurationRun run = DurationRunOf(sample);
+    return run.decodeTime + ncfUInt64{sample - run.first} * Duration(run.entry);
+}
+
+ncfUInt32 SampleTimes::LongestSample() const {
+    ncfUInt32 longest = 0;
+    ncfUInt32 duration = 0;
+    ncfUInt32 first = 0;
+    for (ncfUInt32 entry = 0; entry < durationEntries_; ++entry) {
+        if (DurationCount(entry) > 0 && Duration(entry) > duration) {
+            longest = first;
+            duration = Duration(entry);
+        }
+        first += DurationCount(entry);
+    }
+    return longest;
+}
+
 ncfSInt64 SampleTimes::DisplayOffsetOf(ncfUInt32 sample) const {
     return offsets_ == nullptr ? 0 : Offset(OffsetRunOf(sample).entry) - shift_;
 }

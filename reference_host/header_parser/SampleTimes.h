@@ -25,6 +25,7 @@ public:
     Verdict Read(const Atom& durations, const Atom& offsets, ncfUInt32 sampleCount);
 
     ncfUInt32 DurationOf(ncfUInt32 sample) const;
+    ncfUInt64 DecodeTimeOf(ncfUInt32 sample) const;
     // Shifted so that the first picture shown has the decode time of the
     // first sample, which is 0.
     ncfSInt64 DisplayOffsetOf(ncfUInt32 sample) const;
@@ -32,7 +33,15 @@ public:
     bool IsReordered() const { return isReordered_; }
     bool HasOneDuration() const { return hasOneDuration_; }
     ncfUInt64 TotalDuration() const { return total_; }
+    // Where the last picture shown ends, on the axis that edits count on.
+    ncfUInt64 DisplayEnd() const {
+        const ncfSInt64 end = static_cast<ncfSInt64>(displayEnd_) + shift_;
+        return end < 0 ? 0 : static_cast<ncfUInt64>(end);
+    }
     ncfUInt64 MeanDuration() const { return sampleCount_ == 0 ? 0 : total_ / sampleCount_; }
+
+    // The first of the samples that last longest. There must be one.
+    ncfUInt32 LongestSample() const;
 
     // The sample on show at that time of the shifted display axis; false
     // behind the end.

@@ -265,6 +265,28 @@ Told ReadAlacConfig(const Atom& alac) {
     return told;
 }
 
+// TrueHD: the decoder gives the largest of the presentations in a stream.
+Told ReadTrueHdConfig(const Atom& dmlp) {
+    // Pairs and single ones, from the lowest bit.
+    constexpr ncfUInt32 kSpeakers[] = {2, 1, 1, 2, 2, 2, 2, 1, 1, 2, 2, 1, 1};
+    BitReader bits(dmlp.begin, dmlp.end);
+    const ncfUInt32 rate = bits.Take(4);
+    bits.Skip(1 + 1 + 2 + 2 + 2);  // kinds of channels
+    const ncfUInt32 upToSix = bits.Take(5);
+    bits.Skip(2);
+    const ncfUInt32 upToEight = bits.Take(13);
+    if (bits.Failed() || (rate & 7) > 2) {
+        return Told();
+    }
+    Told told;
+    told.rate = (rate < 8 ? 48000u : 44100u) << (rate & 7);
+    const ncfUInt32 places = upToEight != 0 ? upToEight : upToSix;
+    for (std::size_t i = 0; i < std::size(kSpeakers); ++i) {
+        told.channels += (places >> i & 1) != 0 ? kSpeakers[i] : 0;
+    }
+    return told;
+}
+
 Told ReadNothing(const Atom&) {
     return {};
 }
@@ -282,7 +304,8 @@ const ConfigRow kRows[] = {
     {Code("mp4a"), Code("esds"), ReadStreamConfig}, {Code("Opus"), Code("dOps"), ReadOpusConfig},
     {Code("ac-3"), Code("dac3"), ReadAc3Config},    {Code("ec-3"), Code("dec3"), ReadEac3Config},
     {Code("fLaC"), Code("dfLa"), ReadFlacConfig},   {Code("alac"), Code("alac"), ReadAlacConfig},
-    {Code("samr"), 0, ReadNothing, {1, 8000}},      {Code("sawb"), 0, ReadNothing, {1, 16000}},
+    {Code("mlpa"), Code("dmlp"), ReadTrueHdConfig}, {Code("samr"), 0, ReadNothing, {1, 8000}},
+    {Code("sawb"), 0, ReadNothing, {1, 16000}},
 };
 
 Atom FindConfig(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt32 type) {

@@ -74,7 +74,7 @@ struct RawFields {
     ncfUInt32 linearFlags = 0;      // version 2
 };
 
-RawFields ReadFields(ByteReader& reader, bool isIso) {
+RawFields ReadFields(ByteReader& reader, bool isIso, bool hasWholeRate) {
     RawFields raw;
     reader.Skip(8);
     raw.version = reader.U16();
@@ -83,7 +83,7 @@ RawFields ReadFields(ByteReader& reader, bool isIso) {
     raw.bits = reader.U16();
     raw.compressionId = static_cast<ncfSInt16>(reader.U16());
     reader.Skip(2);
-    raw.rate = reader.U32() / 65536.0;
+    raw.rate = reader.U32() / (hasWholeRate ? 1.0 : 65536.0);
     if (raw.version == 1 && !isIso) {
         raw.framesPerPacket = reader.U32();
         reader.Skip(4);  // bytes of one channel
@@ -180,7 +180,8 @@ void DescribeCompressed(const RawFields& raw, SoundDescription& description) {
 Verdict ReadSoundDescription(const Atom& entry, bool isIso, ncfUInt32 mediaTimeScale,
                              SoundDescription& description) {
     ByteReader reader(entry.begin, entry.end);
-    const RawFields raw = ReadFields(reader, isIso);
+    // The rates of TrueHD do not fit into the whole half of the field.
+    const RawFields raw = ReadFields(reader, isIso, entry.type == Code("mlpa"));
     if (raw.version > 2) {
         return OfUnknownVersion(entry, raw.version);
     }

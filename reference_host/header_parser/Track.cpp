@@ -245,50 +245,61 @@ Verdict ReadDescriptions(const Atom& stsd, const std::vector<bool>& references, 
 }
 
 // Whether the track plays its media whole by what the headers of both say, to
-// the nearest unit of the media.
-bool PlaysAll(ncfUInt64 duration, ncfUInt64 mediaDuration, ncfUInt32 movieTimeScale,
-              ncfUInt32 mediaTimeScale) {
-    if (duration > kMax32 || mediaDuration > kMax32) {
-        return false;
-    }
-    const ncfUInt64 played = duration * mediaTimeScale;
-    const ncfUInt64 held = mediaDuration * movieTimeScale;
-    return (played > held ? played - held : held - played) <= movieTimeScale / 2;
+// the nearest unit of the media. None of the three is above 32 bits.
+bool PlaysAll(ncfUInt64 duration, ncfUInt64 mediaDuration, const EditList::Scales& scales) {
+    const ncfUInt64 played = duration * scales.media;
+    const ncfUInt64 held = mediaDuration * scales.movie;
+    return (played > held ? played - held : held - played) <= scales.movie / 2;
 }
 
 // A medium lasts as long as its samples. Its header is believed where it says so
-// too, give or take a sample, and of plain sound where the track agrees with it:
-// hosts read that from the file, up to the end that both tell.
-ncfUInt64 DurationOfMedia(std::optional<ncfUInt64> header, bool isPlainSoundPlayedWhole,
-                          const SampleTimes& samples) {
+// too, give or take a sample.
+ncfUInt64 DurationOfMedia(std::optional<ncfUInt64> header, const SampleTimes& samples) {
     const ncfUInt64 sum = samples.TotalDuration();
     const ncfUInt64 told = header.value_or(sum);
-    if (sum == 0 || isPlainSoundPlayedWhole) {
-        return told;
-    }
-    return (told > sum ? told - sum : sum - told) > samples.MeanDuration() ? sum : told;
+    const ncfUInt64 difference = told > sum ? told - sum : sum - told;
+    return sum != 0 && difference > samples.MeanDuration() ? sum : told;
 }
 
-// The track's duration is that of its edits, its header, or its media.
+// A track lasts as long as it tells, but no longer than its media, give or take a
+// sample and a unit. One that shows none of its media has nothing to go by.
+ncfUInt64 DurationOfTrack(ncfUInt64 told, ncfUInt64 mediaDuration, const EditList::Scales& scales,
+                          const Track& track) {
+    const SampleTimes& samples = track.samples.Times();
+    const bool isTimed = samples.TotalDuration() != 0 &&
+                         (track.kind == TrackKind::kVideo || track.kind == TrackKind::kSound);
+    const ncfUInt64 filled =
+        isTimed ? track.edits.Filled(std::max(mediaDuration, samples.DisplayEnd()), scales) : 0;
+    const ncfUInt64 sample = MultiplyDivide(samples.MeanDuration(), scales.movie, scales.media);
+    return filled != 0 && told > filled && told - filled > sample + 1 ? filled : told;
+}
+
+// Plain sound whose track and media headers agree is read from the file by hosts,
+// up to the end that both tell: they go on agreeing, whatever the samples say.
 Verdict SetDurations(std::optional<ncfUInt64> header, std::optional<ncfUInt64> media,
                      ncfUInt32 movieTimeScale, Track& track) {
+    const EditList::Scales scales{movieTimeScale, track.mediaTimeScale};
     std::optional<ncfUInt64> told = header;
     if (track.edits.Duration() != 0) {
         told = track.edits.Duration();
     }
-    const bool isPlainSoundPlayedWhole =
-        !track.sound.empty() && track.sound.front().isLinear && told && media &&
-        PlaysAll(*told, *media, movieTimeScale, track.mediaTimeScale);
-    const ncfUInt64 mediaDuration =
-        DurationOfMedia(media, isPlainSoundPlayedWhole, track.samples.Times());
+    ncfUInt64 mediaDuration = DurationOfMedia(media, track.samples.Times());
     const ncfUInt64 duration =
-        told.value_or(MultiplyDivide(mediaDuration, movieTimeScale, track.mediaTimeScale));
-    if (media.value_or(0) > kMax32 || mediaDuration > kMax32 || duration > kMax32) {
-        return NotSupported(fmt::format("its duration of {} units does not fit 32 bits",
-                                        std::max({media.value_or(0), mediaDuration, duration})));
+        told.value_or(MultiplyDivide(mediaDuration, scales.movie, scales.media));
+    const ncfUInt64 longest = std::max({media.value_or(0), mediaDuration, duration});
+    if (longest > kMax32) {
+        return NotSupported(fmt::format("its duration of {} units does not fit 32 bits", longest));
     }
+    const ncfUInt64 bounded = DurationOfTrack(duration, mediaDuration, scales, track);
+    if (!track.sound.empty() && track.sound.front().isLinear && told && media &&
+        PlaysAll(duration, *media, scales)) {
+        mediaDuration =
+            bounded == duration ? *media : MultiplyDivide(bounded, scales.media, scales.movie);
+    }
+    track.isShorterThanTold = bounded < duration;
+    track.toldMediaDuration = static_cast<ncfUInt32>(media.value_or(0));
     track.mediaDuration = static_cast<ncfUInt32>(mediaDuration);
-    track.duration = static_cast<ncfUInt32>(duration);
+    track.duration = static_cast<ncfUInt32>(bounded);
     return Fine();
 }
 

@@ -6,6 +6,7 @@
 #include <cstring>
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/RasterClaim.h"
 #include "reference_host/quicktime/pixels/PixelLayout.h"
 
 extern "C" {
@@ -74,8 +75,11 @@ FrameOwner DecodeFirstPicture(AVFormatContext& input, int stream) {
     const CodecOwner codec(decoder ? avcodec_alloc_context3(decoder) : nullptr);
     FrameOwner frame(av_frame_alloc());
     const PacketOwner packet(av_packet_alloc());
-    if (!codec || !frame || !packet || avcodec_parameters_to_context(codec.get(), &form) < 0 ||
-        avcodec_open2(codec.get(), decoder, nullptr) < 0) {
+    if (!codec || !frame || !packet || avcodec_parameters_to_context(codec.get(), &form) < 0) {
+        return nullptr;
+    }
+    codec->max_pixels = MostPixels(form);
+    if (avcodec_open2(codec.get(), decoder, nullptr) < 0) {
         return nullptr;
     }
     UseOneStream(input, stream);

@@ -18,11 +18,19 @@ ncfUInt64 Frames(double units, double rate) {
 
 }  // namespace
 
-std::unique_ptr<EditedSound> EditedSound::Open(const std::filesystem::path& path,
-                                               const Source& source, bool hasWholeIndex) {
+bool EditedSound::MustDivide(const Source& source) {
     const auto pieces = std::count_if(source.edits.begin(), source.edits.end(),
                                       [](const auto& edit) { return edit.mediaTime >= 0; });
-    const bool isCut = hasWholeIndex && pieces > 1 && source.timeScale > 0;
+    const bool beginsWithin = std::any_of(source.edits.begin(), source.edits.end(),
+                                          [](const auto& edit) { return edit.mediaTime > 0; });
+    const AVRational frame{1, static_cast<int>(source.form.sampleRate)};
+    return source.timeScale > 0 &&
+           (pieces > 1 || (beginsWithin && av_cmp_q(source.mediaUnit, frame) != 0));
+}
+
+std::unique_ptr<EditedSound> EditedSound::Open(const std::filesystem::path& path,
+                                               const Source& source, bool hasWholeIndex) {
+    const bool isCut = hasWholeIndex && MustDivide(source);
     auto decoder = SoundDecoder::Open(path, source.stream, source.form, hasWholeIndex,
                                       isCut ? InputView::WholeMedia : InputView::AsPresented);
     if (!decoder) {

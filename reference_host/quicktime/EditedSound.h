@@ -8,14 +8,16 @@
 namespace host {
 
 // The sound of one track as the movie presents it. The multimedia library
-// applies an edit list of one piece exactly, but cuts several at its packets;
-// those are put together here from the whole media.
+// applies an edit list of one piece exactly where the media counts its time in
+// frames of sound. In other units it takes each for a frame, and it cuts several
+// pieces at its packets; those are put together here from the whole media.
 class EditedSound {
 public:
     struct Source {
         int stream = -1;
         std::vector<MovieAtoms::Edit> edits;  // none: as the library presents it
         ncfUInt32 timeScale = 0;              // of the durations of edits
+        AVRational mediaUnit{0, 1};           // seconds of their times
         SoundForm form;                       // as it is delivered
     };
     static std::unique_ptr<EditedSound> Open(const std::filesystem::path& path,
@@ -33,6 +35,7 @@ private:
         ncfSInt64 media;  // frame of the media, -1 for silence
     };
     explicit EditedSound(std::unique_ptr<SoundDecoder> decoder) : decoder_(std::move(decoder)) {}
+    static bool MustDivide(const Source& source);
     void Divide(const Source& source);
 
     std::unique_ptr<SoundDecoder> decoder_;

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <fstream>
+#include <limits>
 
 namespace host {
 namespace {
@@ -98,6 +99,9 @@ private:
             case Code("tkhd"):
                 ReadTrackHeader(position, end);
                 return;
+            case Code("mdhd"):
+                ReadMediaHeader(position, end);
+                return;
             case Code("stsd"):
                 ReadDescriptions(position, end, depth);
                 return;
@@ -106,6 +110,9 @@ private:
                 return;
             case Code("elst"):
                 ReadEdits(position, end);
+                return;
+            case Code("stts"):
+                FindDurations(position, end);
                 return;
             case Code("stsc"):
                 ReadChunks(position, end);
@@ -144,6 +151,21 @@ private:
         out_.tracks.back().duration = isLong ? Number(bytes + 28, 8) : Number(bytes + 20, 4);
     }
 
+    void ReadMediaHeader(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[32];
+        const std::size_t least = 20;
+        if (out_.tracks.empty() || end - position < least || !Read(position, bytes, least)) {
+            return;
+        }
+        const bool isLong = bytes[0] == 1;
+        if (isLong && (end - position < sizeof bytes || !Read(position, bytes, sizeof bytes))) {
+            return;
+        }
+        out_.tracks.back().mediaTimeScale =
+            static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
+        out_.tracks.back().mediaDuration = isLong ? Number(bytes + 24, 8) : Number(bytes + 16, 4);
+    }
+
     void ReadEdits(ncfUInt64 position, ncfUInt64 end) {
         constexpr ncfUInt64 kPlain = 0x10000;
         ncfUInt8 bytes[20];
@@ -177,22 +199,43 @@ private:
             const ncfUInt64 count = Number(bytes + 4, 4);
             out_.tracks.back().descriptionCount =
                 static_cast<ncfUInt32>(count < most ? count : most);
-            ReadFirstDescription(position + 8, end, depth);
+            ReadFirstDescription(position + 8, end, bytes[0] != 0, depth);
         }
     }
 
-    // Of the one kind of sound whose form stands in an atom behind the fields.
-    void ReadFirstDescription(ncfUInt64 position, ncfUInt64 end, int depth) {
+    // The size of pictures, and of the one kind of sound whose form stands in an
+    // atom behind the fields, that. In a list of the ISO form version 1 adds none.
+    void ReadFirstDescription(ncfUInt64 position, ncfUInt64 end, bool isIso, int depth) {
         constexpr ncfUInt64 kFields = 36;
-        ncfUInt8 bytes[8];
-        if (end - position < kFields || !Read(position, bytes, sizeof bytes)) {
+        constexpr ncfUInt64 kFieldsOfVersion1 = kFields + 16;
+        constexpr ncfUInt64 kFieldsOfVersion2 = kFields + 36;
+        ncfUInt8 bytes[kFields + 4];
+        if (end - position < sizeof bytes || !Read(position, bytes, sizeof bytes)) {
             return;
         }
+        out_.tracks.back().width = static_cast<ncfUInt32>(Number(bytes + 32, 2));
+        out_.tracks.back().height = static_cast<ncfUInt32>(Number(bytes + 34, 2));
         const ncfUInt64 size = Number(bytes, 4);
         const ncfUInt64 code = Number(bytes + 4, 4);
+        const ncfUInt64 version = Number(bytes + 16, 2);
+        const ncfUInt64 fields = version == 2
+                                     ? std::max(kFieldsOfVersion2, Number(bytes + kFields, 4))
+                                 : version == 1 && !isIso ? kFieldsOfVersion1
+                                                          : kFields;
         const bool isLinear = code == Code("ipcm") || code == Code("fpcm");
-        if (isLinear && size >= kFields && size <= end - position) {
-            Descend(position + kFields, position + size, depth);
+        if (isLinear && size >= fields && size <= end - position) {
+            Descend(position + fields, position + size, depth);
+        }
+    }
+
+    // The table may be long, and few ask for it.
+    void FindDurations(ncfUInt64 position, ncfUInt64 end) {
+        ncfUInt8 bytes[8];
+        if (!out_.tracks.empty() && !out_.tracks.back().durationsAt && end - position >= 8 &&
+            Read(position, bytes, sizeof bytes)) {
+            out_.tracks.back().durationsAt = position + 8;
+            out_.tracks.back().durationEntries =
+                static_cast<ncfUInt32>(std::min(Number(bytes + 4, 4), (end - position - 8) / 8));
         }
     }
 
@@ -266,6 +309,34 @@ const MovieAtoms::Track* MovieAtoms::Find(ncfUInt32 id) const {
         }
     }
     return nullptr;
+}
+
+std::optional<SampleDurations> SumDurations(const std::filesystem::path& path,
+                                            const MovieAtoms::Track& track) {
+    constexpr ncfUInt64 kMost = std::numeric_limits<ncfUInt64>::max() / 2;
+    std::ifstream stream(path, std::ios::binary);
+    if (!track.durationsAt ||
+        !stream.seekg(static_cast<std::streamoff>(track.durationsAt.value()))) {
+        return std::nullopt;
+    }
+    const auto number = [](const ncfUInt8* bytes) {
+        return ncfUInt64{bytes[0]} << 24 | ncfUInt64{bytes[1]} << 16 | ncfUInt64{bytes[2]} << 8 |
+               bytes[3];
+    };
+    SampleDurations sum;
+    ncfUInt8 entry[8];
+    for (ncfUInt32 i = 0; i < track.durationEntries; ++i) {
+        if (!stream.read(reinterpret_cast<char*>(entry), sizeof entry)) {
+            return std::nullopt;
+        }
+        const ncfUInt64 units = number(entry) * number(entry + 4);
+        if (units > kMost - sum.units) {
+            return std::nullopt;
+        }
+        sum.samples += number(entry);
+        sum.units += units;
+    }
+    return sum;
 }
 
 MovieAtoms ReadMovieAtoms(const std::filesystem::path& path) {

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <filesystem>
+#include <optional>
 #include <vector>
 
 #include "host_interfaces/framework/Types.h"
@@ -28,6 +29,14 @@ struct MovieAtoms {
         // number, 0 for none, and whether its low byte comes first.
         ncfUInt32 linearBits = 0;
         bool isLittleEndian = false;
+        ncfUInt32 mediaTimeScale = 0;
+        ncfUInt64 mediaDuration = 0;  // media time units, as its header tells
+        // Where the table of sample durations is, behind its count. None: no table.
+        std::optional<ncfUInt64> durationsAt;
+        ncfUInt32 durationEntries = 0;
+        // Of pictures, as the first description has it.
+        ncfUInt32 width = 0;
+        ncfUInt32 height = 0;
         std::vector<Edit> edits;  // none where some do not play as fast as the media
     };
     ncfUInt32 timeScale = 0;  // 0: no movie header was found
@@ -39,5 +48,14 @@ struct MovieAtoms {
 };
 
 MovieAtoms ReadMovieAtoms(const std::filesystem::path& path);
+
+// Samples of a track by the table of their durations, and what they last in sum.
+struct SampleDurations {
+    ncfUInt64 samples = 0;
+    ncfUInt64 units = 0;  // media time units
+};
+// Nothing where there is no such table, or its sum is beyond 63 bits.
+std::optional<SampleDurations> SumDurations(const std::filesystem::path& path,
+                                            const MovieAtoms::Track& track);
 
 }  // namespace host

@@ -9,12 +9,12 @@ extern "C" {
 }
 
 #include <algorithm>
-#include <fstream>
 #include <iterator>
 #include <limits>
+#include <numeric>
 #include <set>
 
-#include "reference_host/header_parser/QTParser.h"
+#include "reference_host/header_parser/InspectHeaders.h"
 #include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/PacketList.h"
 
@@ -65,37 +65,45 @@ double SecondsOf(const std::vector<PacketEntry>& packets, const AVStream& stream
     return span > 0.0 ? span * av_q2d(stream.time_base) : 0.0;
 }
 
-// From the start of the first sample to that of the last.
-double SpanOfIndex(AVStream& stream) {
-    const int count = avformat_index_get_entries_count(&stream);
-    return count < 2
-               ? 0.0
-               : static_cast<double>(avformat_index_get_entry(&stream, count - 1)->timestamp) -
-                     static_cast<double>(avformat_index_get_entry(&stream, 0)->timestamp);
-}
-
 // 0 for none.
 ncfUInt32 Lowest(const std::vector<ncfUInt32>& tracks) {
     return tracks.empty() ? 0 : *std::min_element(tracks.begin(), tracks.end());
-}
-
-// Whether the header parser takes the movie.
-bool HeaderIsRead(const std::filesystem::path& path) {
-    std::ifstream stream(path, std::ios::binary);
-    const auto readAt = [&stream](ncfUInt64 position, ncfUInt8* to, ncfUInt32 wanted) {
-        stream.clear();
-        stream.seekg(static_cast<std::streamoff>(position));
-        stream.read(reinterpret_cast<char*>(to), wanted);
-        return static_cast<ncfUInt32>(stream.gcount());
-    };
-    return header_parser::ReadHeaders(*MakeRef<header_parser::QTParser>(), readAt) >= 0;
 }
 
 }  // namespace
 
 std::unique_ptr<MovieFile> MovieFile::Open(const std::filesystem::path& path, std::string& reason) {
     InputOwner input = OpenInput(path, InputView::AsPresented, reason);
-    return input ? std::unique_ptr<MovieFile>(new MovieFile(path, std::move(input))) : nullptr;
+    if (!input) {
+        return nullptr;
+    }
+    std::unique_ptr<MovieFile> movie(new MovieFile(path, std::move(input)));
+    if (movie->HasTooManyChannels()) {
+        reason = TooManyChannels();
+        return nullptr;
+    }
+    return movie;
+}
+
+// Those that come out of the decoders, which may be more than the headers tell.
+// They are only counted where so many could come.
+bool MovieFile::HasTooManyChannels() {
+    constexpr int kMostOfADecoder = 64;  // where the container tells less
+    int possible = 0;
+    for (unsigned i = 0; i < input_->nb_streams; ++i) {
+        const AVCodecParameters& form = *input_->streams[i]->codecpar;
+        if (form.codec_type == AVMEDIA_TYPE_AUDIO) {
+            possible += std::max(form.ch_layout.nb_channels, kMostOfADecoder);
+        }
+    }
+    if (possible <= kMostChannelsOfMovie) {
+        return false;
+    }
+    soundForms_ = ReadSoundForms(path_, *input_, IndexIsWhole());
+    const auto channels = std::accumulate(
+        soundForms_->begin(), soundForms_->end(), ncfUInt64{0},
+        [](ncfUInt64 sum, const auto& sound) { return sum + sound.second.channels; });
+    return channels > kMostChannelsOfMovie;
 }
 
 MovieFile::MovieFile(std::filesystem::path path, InputOwner input)
@@ -104,9 +112,7 @@ MovieFile::MovieFile(std::filesystem::path path, InputOwner input)
         atoms_ = ReadMovieAtoms(path_);
     }
     NumberTracks();
-    const std::vector<ncfUInt32> pictures = TracksWhere(&MovieFile::IsVideo);
-    countsAsInFile_ =
-        !std::is_sorted(pictures.begin(), pictures.end()) && IndexIsWhole() && HeaderIsRead(path_);
+    firstVideo_ = ChooseFirstVideo();
     const bool isByContainer = !HasStreamDetails(*input_);
     for (unsigned i = 0; i < input_->nb_streams; ++i) {
         const AVStream& stream = *input_->streams[i];
@@ -209,9 +215,23 @@ std::vector<ncfUInt32> MovieFile::TracksWhere(bool (MovieFile::*test)(ncfUInt32)
     return tracks;
 }
 
-ncfUInt32 MovieFile::FirstVideo() const {
-    const std::vector<ncfUInt32> tracks = TracksWhere(&MovieFile::IsVideo);
-    return countsAsInFile_ ? tracks.front() : Lowest(tracks);
+// Which of several the header shows is asked of its parser: handlers tell it the
+// kinds of tracks, and codes tell the library.
+ncfUInt32 MovieFile::ChooseFirstVideo() const {
+    const std::vector<ncfUInt32> pictures = TracksWhere(&MovieFile::IsVideo);
+    if (pictures.size() > 1 && IndexIsWhole()) {
+        const header_parser::HeaderReport header = header_parser::InspectHeaders(path_);
+        if (const auto place = header.ShownTrack()) {
+            const ncfUInt32 id = header.movie->tracks[*place].id;
+            const int stream = *place < input_->nb_streams && IdOf(*place) == id
+                                   ? static_cast<int>(*place)
+                                   : StreamOf(id);
+            if (stream >= 0 && IsVideo(numbers_[static_cast<std::size_t>(stream)])) {
+                return numbers_[static_cast<std::size_t>(stream)];
+            }
+        }
+    }
+    return Lowest(pictures);
 }
 
 ncfUInt32 MovieFile::FirstAudio() const {
@@ -266,25 +286,42 @@ MovieFile::Raster MovieFile::RasterOf(ncfUInt32 track) {
                : RasterNow(*FindDetailedTrack(track));
 }
 
-// Samples by the time that the media takes, without regard to edits. 0.0 where
-// the container does not tell both.
+// Samples by the time that the media takes, without regard to edits, as a header
+// that is read has it: what the table of durations sums up to, or what the
+// media's header tells where that is within a sample. 0.0 for a table of none,
+// nothing where there is no table.
+std::optional<double> MovieFile::RateOfTable(int stream) const {
+    const MovieAtoms::Track* const atoms = FindAtoms(numbers_[static_cast<std::size_t>(stream)]);
+    const auto sum = atoms ? SumDurations(path_, *atoms) : std::nullopt;
+    if (!sum || atoms->mediaTimeScale == 0) {
+        return std::nullopt;
+    }
+    if (sum->samples == 0) {
+        return 0.0;
+    }
+    const ncfUInt64 told =
+        IsKnownDuration(atoms->mediaDuration) ? atoms->mediaDuration : sum->units;
+    const ncfUInt64 difference = told > sum->units ? told - sum->units : sum->units - told;
+    const bool isSumUp = sum->units > 0 && difference > sum->units / sum->samples;
+    const ncfUInt64 units = isSumUp ? sum->units : told;
+    return units == 0 ? std::nullopt
+                      : std::optional(static_cast<double>(sum->samples) * atoms->mediaTimeScale /
+                                      static_cast<double>(units));
+}
+
+// The same of a movie whose atoms can't be read where they lie. 0.0 where the
+// library does not tell both.
 double MovieFile::MeanRateOfMedia(int stream) const {
     std::string ignored;
-    const InputOwner whole =
-        IndexIsWhole() ? OpenInput(path_, InputView::WholeMedia, ignored) : nullptr;
+    const InputOwner whole = OpenInput(path_, InputView::WholeMedia, ignored);
     if (!whole || stream >= static_cast<int>(whole->nb_streams)) {
         return 0.0;
     }
-    AVStream& of = *whole->streams[stream];
-    if (of.nb_frames <= 0 || !IsKnownDuration(of.duration)) {
-        return 0.0;
-    }
-    // A header that ends before the last sample begins is wrong.
-    const double span = SpanOfIndex(of);
-    const auto told = static_cast<double>(of.duration);
-    const auto samples = static_cast<double>(of.nb_frames);
-    const double rate = told < span ? (samples - 1) / span : samples / told;
-    return rate / av_q2d(of.time_base);
+    const AVStream& of = *whole->streams[stream];
+    return of.nb_frames > 0 && IsKnownDuration(of.duration)
+               ? static_cast<double>(of.nb_frames) /
+                     (static_cast<double>(of.duration) * av_q2d(of.time_base))
+               : 0.0;
 }
 
 // Pictures by the time from the first to the end of the last. 0.0 for a track
@@ -307,11 +344,27 @@ bool MovieFile::MayHoldFieldsApart(int stream) const {
            form.codec_id == AV_CODEC_ID_H264 && form.field_order != AV_FIELD_PROGRESSIVE;
 }
 
+// Whether a track of a movie whose tables stand in its header has samples at all.
+// Edits may show none of them.
+bool MovieFile::HoldsSamples(int stream) const {
+    if (avformat_index_get_entries_count(input_->streams[stream]) > 0) {
+        return true;
+    }
+    std::string ignored;
+    const InputOwner whole = OpenInput(path_, InputView::WholeMedia, ignored);
+    return whole && stream < static_cast<int>(whole->nb_streams) &&
+           avformat_index_get_entries_count(whole->streams[stream]) > 0;
+}
+
 double MovieFile::PictureRate() {
     const ncfUInt32 track = FirstVideo();
     const int stream = StreamOf(track);
-    if (stream < 0) {
+    if (stream < 0 || (IndexIsWhole() && !HoldsSamples(stream))) {
         return 0.0;
+    }
+    const auto ofTable = IndexIsWhole() ? RateOfTable(stream) : std::nullopt;
+    if (ofTable) {
+        return *ofTable;
     }
     const double mean = IndexIsWhole() ? MeanRateOfMedia(stream)
                         : atoms_.isFragmented || MayHoldFieldsApart(stream)

@@ -43,10 +43,10 @@ public:
     bool IsVideo(ncfUInt32 track) const;  // pictures attached to sound are none
     bool IsAudio(ncfUInt32 track) const;
     bool IsTimecode(ncfUInt32 track) const;
-    // The picture track that is described and delivered, 0 for none. Readers of
-    // the movie's header count tracks as they stand in the file; who has nothing
-    // but the wrapper walks their numbers from the lowest.
-    ncfUInt32 FirstVideo() const;
+    // The picture track that is described and delivered, 0 for none: of a movie
+    // whose header a clip is made of, the first that its parser names; who has
+    // nothing but the wrapper walks the numbers from the lowest.
+    ncfUInt32 FirstVideo() const { return firstVideo_; }
     ncfUInt32 FirstAudio() const;                     // of the lowest number
     std::map<ncfUInt32, int> StreamsByTrack() const;  // ids included
 
@@ -77,10 +77,14 @@ public:
 
 private:
     MovieFile(std::filesystem::path path, InputOwner input);
+    bool HasTooManyChannels();
     void NumberTracks();
+    ncfUInt32 ChooseFirstVideo() const;
     ncfUInt32 IdOf(unsigned stream) const;  // 0 for none
     bool NeedsPacketTimes() const;
     bool MayHoldFieldsApart(int stream) const;
+    std::optional<double> RateOfTable(int stream) const;
+    bool HoldsSamples(int stream) const;
     double MeanRateOfMedia(int stream) const;
     double MeanRateOfPackets(int stream);
     double SecondsOfPackets(int stream);
@@ -90,7 +94,7 @@ private:
     InputOwner input_;
     MovieAtoms atoms_;
     std::vector<ncfUInt32> numbers_;  // of the stream at the same place
-    bool countsAsInFile_ = false;     // picture tracks, not by their numbers
+    ncfUInt32 firstVideo_ = 0;
     struct Told {
         AVFieldOrder fieldOrder;
         AVRational rate;

@@ -24,8 +24,6 @@ namespace {
 // The largest block that the library may ask for. A picture of 16384 x 16384
 // with an alpha takes all of it.
 constexpr std::size_t kLargestBlock = std::size_t{1} << 30;
-// Of all sounds of a movie together, as the header parser has it.
-constexpr int kMostChannels = 1024;
 
 constexpr int kBufferBytes = 32768;
 
@@ -139,11 +137,29 @@ void NameFloatSound(AVFormatContext& input, const std::filesystem::path& path) {
     }
 }
 
+// Of MPEG-4 the library keeps the size that the first samples tell. That of the
+// description counts, as for all others: it is what a host makes its buffers for.
+void TakeSizesOfDescriptions(AVFormatContext& input, const std::filesystem::path& path) {
+    const MovieAtoms atoms = ReadMovieAtoms(path);
+    for (unsigned i = 0; i < input.nb_streams; ++i) {
+        AVCodecParameters& form = *input.streams[i]->codecpar;
+        const auto id = static_cast<ncfUInt32>(input.streams[i]->id);
+        const bool isOne = std::count_if(atoms.tracks.begin(), atoms.tracks.end(),
+                                         [id](const auto& each) { return each.id == id; }) == 1;
+        const auto* const track = isOne ? atoms.Find(id) : nullptr;
+        if (form.codec_type == AVMEDIA_TYPE_VIDEO && track && track->width > 0 &&
+            track->height > 0) {
+            form.width = static_cast<int>(track->width);
+            form.height = static_cast<int>(track->height);
+        }
+    }
+}
+
 int CountChannels(const AVFormatContext& input) {
     int channels = 0;
-    for (unsigned i = 0; i < input.nb_streams && channels <= kMostChannels; ++i) {
+    for (unsigned i = 0; i < input.nb_streams && channels <= kMostChannelsOfMovie; ++i) {
         const int more = input.streams[i]->codecpar->ch_layout.nb_channels;
-        channels += std::clamp(more, 0, kMostChannels + 1);
+        channels += std::clamp(more, 0, kMostChannelsOfMovie + 1);
     }
     return channels;
 }
@@ -153,14 +169,18 @@ std::string FindFault(const AVFormatContext& input) {
     if (input.nb_streams == 0) {
         return "the file holds no tracks";
     }
-    if (CountChannels(input) > kMostChannels) {
-        return "the sounds of the movie have more than " + std::to_string(kMostChannels) +
-               " channels together";
+    if (CountChannels(input) > kMostChannelsOfMovie) {
+        return TooManyChannels();
     }
     return {};
 }
 
 }  // namespace
+
+std::string TooManyChannels() {
+    return "the sounds of the movie have more than " + std::to_string(kMostChannelsOfMovie) +
+           " channels together";
+}
 
 void CloseInput::operator()(AVFormatContext* context) const {
     AVIOContext* const bytes = context->pb;  // the library closes none that it was given
@@ -187,6 +207,9 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     AVDictionary* options = nullptr;
     // The bytes are at hand, so no way of reaching a file is needed.
     av_dict_set(&options, "protocol_whitelist", "none", 0);
+    // A track that names another as its chapters changes nothing of that other,
+    // which the library would take for no picture track.
+    av_dict_set(&options, "ignore_chapters", "1", 0);
     if (view == InputView::WholeMedia) {
         av_dict_set(&options, "ignore_editlist", "1", 0);
     }
@@ -201,8 +224,11 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     if (IsMovieFamily(*input)) {
         NameFloatSound(*input, path);
     }
-    if (CountChannels(*input) <= kMostChannels && !AreStreamsKnown(*input)) {
+    if (CountChannels(*input) <= kMostChannelsOfMovie && !AreStreamsKnown(*input)) {
         FindStreamDetails(*input);
+        if (IsMovieFamily(*input)) {
+            TakeSizesOfDescriptions(*input, path);
+        }
     }
     reason = FindFault(*input);
     return reason.empty() ? std::move(input) : nullptr;

@@ -20,6 +20,11 @@ enum class InputView {
 // ever read: lists of other files, picture sequences and the like lead nowhere.
 InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::string& reason);
 
+// Of all sounds of a movie together, as the header parser has it, and what is said
+// of a movie that has more.
+inline constexpr int kMostChannelsOfMovie = 1024;
+std::string TooManyChannels();
+
 // Whether the container is of the QuickTime and ISO family.
 bool IsMovieFamily(const AVFormatContext& input);
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <string>
 
@@ -10,9 +11,26 @@ namespace host {
 // Why the movie wrapper can't open a file, in a few words; empty when it can.
 std::string OpenProblem(const std::filesystem::path& path);
 
-// Why a picture or sound track of a file finds no decoder, with the name of its
-// codec; empty when it finds one or there is no such track. `place` counts from 0
-// among the tracks of its kind.
-std::string DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place);
+// Codes of samples that nobody reads without a key.
+bool IsEncrypted(std::uint32_t code);
+
+// Why the samples of a track can't be decoded, with the code of their codec;
+// nothing when they can, or when there is no such track.
+struct CodecProblem {
+    std::string sentence;
+    std::uint32_t code = 0;  // of the codec; 0 also where nothing tells it
+
+    explicit operator bool() const { return !sentence.empty(); }
+};
+// `place` counts from 0 among the tracks of its kind.
+CodecProblem DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place);
+// The same of the track at that place of the file, whatever its kind.
+CodecProblem DecoderProblem(const std::filesystem::path& path, std::size_t track);
+
+// Why the first picture track can't have pictures as large as the file tells; empty
+// when it can.
+std::string RasterProblem(const std::filesystem::path& path);
+// Whether a movie's header tells pictures large enough to ask for that: a quick look.
+bool NeedsRasterCheck(const std::filesystem::path& path);
 
 }  // namespace host

@@ -52,6 +52,18 @@ std::vector<PacketEntry> FromIndex(AVStream& stream) {
     return packets;
 }
 
+std::shared_ptr<const Palette> PaletteOf(const AVPacket& packet) {
+    std::size_t size = 0;
+    const std::uint8_t* const colours =
+        av_packet_get_side_data(&packet, AV_PKT_DATA_PALETTE, &size);
+    if (!colours || size != std::tuple_size_v<Palette>) {
+        return nullptr;
+    }
+    const auto palette = std::make_shared<Palette>();
+    std::copy_n(colours, size, palette->begin());
+    return palette;
+}
+
 PacketEntry EntryOf(const AVPacket& packet) {
     PacketEntry entry;
     entry.decodeTime = UsableTime(packet.dts);
@@ -62,6 +74,7 @@ PacketEntry EntryOf(const AVPacket& packet) {
     entry.isSync = (packet.flags & AV_PKT_FLAG_KEY) != 0;
     entry.isDisposable = (packet.flags & AV_PKT_FLAG_DISPOSABLE) != 0;
     entry.isShown = (packet.flags & AV_PKT_FLAG_DISCARD) == 0;
+    entry.palette = PaletteOf(packet);
     return entry;
 }
 
@@ -122,6 +135,24 @@ bool AreAllSync(const std::vector<PacketEntry>& packets) {
                        [](const PacketEntry& packet) { return packet.isSync; });
 }
 
+// Pictures of more bits are no numbers of a palette.
+bool MayHavePalette(const AVStream& stream) {
+    const AVCodecParameters& form = *stream.codecpar;
+    return form.codec_type == AVMEDIA_TYPE_VIDEO && form.bits_per_coded_sample > 0 &&
+           form.bits_per_coded_sample <= 8;
+}
+
+// A palette holds until the next one.
+void SpreadPalettes(std::vector<PacketEntry>& packets) {
+    std::shared_ptr<const Palette> last;
+    for (PacketEntry& packet : packets) {
+        if (!packet.palette) {
+            packet.palette = last;
+        }
+        last = packet.palette;
+    }
+}
+
 // Whether both are shown equally long after they are decoded.
 bool IsShownAsLate(const PacketEntry& a, const PacketEntry& b) {
     const auto isKnown = [](const PacketEntry& packet) {
@@ -142,21 +173,29 @@ ncfSInt64 UsableDuration(ncfSInt64 duration) {
 }
 
 std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool indexIsWhole) {
+    AVStream& of = *input.streams[stream];
     std::vector<PacketEntry> indexed;
+    bool isInOrder = false;
+    std::size_t enough = kPacketsThatTell;
     if (indexIsWhole) {
-        indexed = FromIndex(*input.streams[stream]);
-        if (!MayReorder(*input.streams[stream])) {
+        indexed = FromIndex(of);
+        isInOrder = !MayReorder(of);
+        if (isInOrder && !MayHavePalette(of)) {
             return indexed;
         }
+        enough = isInOrder ? 1 : enough;
+        isInOrder = isInOrder || (!indexed.empty() && AreAllSync(indexed));
     }
-    const bool areAllSync = !indexed.empty() && AreAllSync(indexed);
     std::vector<PacketEntry> packets;
-    bool isInOrder = areAllSync;
     ReadThrough(input, stream, [&](const PacketEntry& entry) {
         packets.push_back(entry);
         isInOrder = isInOrder && IsShownAsLate(packets.front(), entry);
-        return !isInOrder || packets.size() < kPacketsThatTell;
+        return !isInOrder || packets.size() < enough;
     });
+    if (isInOrder && !indexed.empty() && !packets.empty()) {
+        indexed.front().palette = packets.front().palette;
+    }
+    SpreadPalettes(isInOrder ? indexed : packets);
     return isInOrder ? indexed : packets;
 }
 

@@ -2,13 +2,19 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <array>
+#include <cstdint>
 #include <filesystem>
+#include <memory>
 #include <vector>
 
 #include "host_interfaces/framework/Types.h"
 #include "reference_host/quicktime/AvOwners.h"
 
 namespace host {
+
+// Colours of 256 numbers, as the library hands them beside a packet.
+using Palette = std::array<std::uint8_t, AVPALETTE_SIZE>;
 
 // One stored picture of a stream, or another packet of it. Some containers keep
 // the two fields of a picture in a packet each; both are one entry.
@@ -28,6 +34,9 @@ struct PacketEntry {
         ncfUInt32 size = 0;
         bool isApart = false;  // in a packet of its own
     } second;
+    // The one that holds for this packet; null where the container tells none.
+    // Demuxers give it once: with the first packet that is read, or where it changes.
+    std::shared_ptr<const Palette> palette;
 };
 
 // Times beyond this come from damaged files alone. Sums of a few stay in range.

@@ -6,6 +6,7 @@
 #include <algorithm>
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/RasterClaim.h"
 
 namespace host {
 namespace {
@@ -25,12 +26,25 @@ CodecOwner OpenDecoder(const AVStream& stream) {
         return nullptr;
     }
     codec->pkt_timebase = stream.time_base;
+    codec->max_pixels = MostPixels(*stream.codecpar);
     codec->thread_count = 0;  // as many as there are processors
     // Near the end of a stream the decoder would keep good pictures back as well;
     // those that are damaged it marks.
     codec->flags |= AV_CODEC_FLAG_OUTPUT_CORRUPT;
     codec->thread_type = FF_THREAD_FRAME | FF_THREAD_SLICE;
     return avcodec_open2(codec.get(), decoder, nullptr) < 0 ? nullptr : std::move(codec);
+}
+
+// In place of the one that the demuxer gave, which after a seek may be another's.
+void PutPalette(const Palette& palette, AVPacket& packet) {
+    std::size_t size = 0;
+    std::uint8_t* to = av_packet_get_side_data(&packet, AV_PKT_DATA_PALETTE, &size);
+    if (!to || size != palette.size()) {
+        to = av_packet_new_side_data(&packet, AV_PKT_DATA_PALETTE, palette.size());
+    }
+    if (to) {
+        std::copy(palette.begin(), palette.end(), to);
+    }
 }
 
 bool IsDamaged(const AVFrame& frame) {
@@ -44,6 +58,10 @@ std::unique_ptr<PictureReader> PictureReader::Open(const std::filesystem::path& 
     std::string ignored;
     InputOwner input = OpenInput(path, InputView::AsPresented, ignored);
     if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
+        return nullptr;
+    }
+    if (TellsLargePictures(*input->streams[stream]->codecpar) &&
+        !FindImpossibleRaster(path, stream).empty()) {
         return nullptr;
     }
     CodecOwner codec = OpenDecoder(*input->streams[stream]);
@@ -171,6 +189,9 @@ bool PictureReader::Feed() {
             // next may be good. What is left of one behind a file's end some
             // decoders take for a whole.
             if (!marksCutPackets_ || (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0) {
+                if (at < order_.PacketCount() && order_.Packet(at).palette) {
+                    PutPalette(*order_.Packet(at).palette, *packet_);
+                }
                 avcodec_send_packet(codec_.get(), packet_.get());
             }
         }

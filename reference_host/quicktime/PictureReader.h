@@ -18,7 +18,7 @@ namespace host {
 // them filled.
 class PictureReader {
 public:
-    // Null where the stream has no decoder.
+    // Null where the stream has no decoder, or can't hold pictures as large as told.
     static std::unique_ptr<PictureReader> Open(const std::filesystem::path& path, int stream,
                                                bool indexIsWhole);
 

@@ -72,6 +72,7 @@ NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader)
                 EditedSound::Source& source = streams[track];
                 source.stream = stream;
                 source.timeScale = movie_->Atoms().timeScale;
+                source.mediaUnit = movie_->FindTrack(track)->time_base;
                 const SoundForm* const form = movie_->SoundFormOf(track);
                 source.form = form ? *form : SoundForm();
                 if (const MovieAtoms::Track* const atoms = movie_->FindAtoms(track)) {

@@ -121,11 +121,4 @@ int SoundCodec::Receive(AVFrame& frame) {
     }
 }
 
-void SoundCodec::Flush() {
-    avcodec_flush_buffers(codec_.get());
-    parser_.reset();
-    whole_.reset();
-    isEnding_ = false;
-}
-
 }  // namespace host

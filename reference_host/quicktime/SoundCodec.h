@@ -10,7 +10,9 @@
 namespace host {
 
 // A decoder of one sound stream, behind a parser where packets hold several
-// blocks of which the decoder would see the first alone.
+// blocks of which the decoder would see the first alone. It takes packets in a
+// row: a jump needs a new one, since some decoders carry on what a flush does not
+// make them forget.
 class SoundCodec {
 public:
     // Null where there is no decoder. `keepsPriming`: what the container says is
@@ -22,8 +24,6 @@ public:
     // As avcodec_receive_frame; the rate is that of the sound, whatever the
     // container says.
     int Receive(AVFrame& frame);
-    // Forgets all packets, for a jump.
-    void Flush();
 
 private:
     explicit SoundCodec(CodecOwner codec) : codec_(std::move(codec)) {}

@@ -30,6 +30,8 @@ bool LeansOnAllBefore(AVCodecID codec) {
         case AV_CODEC_ID_MACE3:
         case AV_CODEC_ID_MACE6:
         case AV_CODEC_ID_NELLYMOSER:
+        case AV_CODEC_ID_SPEEX:
+        case AV_CODEC_ID_G723_1:
             return true;
         default:
             return false;
@@ -39,6 +41,32 @@ bool LeansOnAllBefore(AVCodecID codec) {
 // Damaged files have times that no sum must be made of.
 ncfSInt64 Rescaled(ncfSInt64 value, AVRational from, AVRational to) {
     return std::clamp(av_rescale_q(value, from, to), -kFarthestTime, kFarthestTime);
+}
+
+// What comes out of an Opus decoder before the sound begins, in frames of 48000, as
+// its configuration tells.
+ncfSInt64 OpusPriming(const AVCodecParameters& form) {
+    constexpr int kPlace = 10;
+    return form.codec_id == AV_CODEC_ID_OPUS && form.extradata && form.extradata_size > kPlace + 1
+               ? form.extradata[kPlace] | form.extradata[kPlace + 1] << 8
+               : 0;
+}
+
+// Where the first stream of a file is heard or seen, in AV_TIME_BASE. Movies in
+// fragments may have no edit that leaves the priming of Opus out.
+ncfSInt64 StartOf(const AVFormatContext& input) {
+    ncfSInt64 first = AV_NOPTS_VALUE;
+    for (unsigned i = 0; i < input.nb_streams && IsMovieFamily(input); ++i) {
+        const AVStream& of = *input.streams[i];
+        const ncfSInt64 start = UsableTime(of.start_time);
+        if (start != AV_NOPTS_VALUE) {
+            const ncfSInt64 begin =
+                Rescaled(start, of.time_base, AV_TIME_BASE_Q) +
+                Rescaled(OpusPriming(*of.codecpar), AVRational{1, 48000}, AV_TIME_BASE_Q);
+            first = first == AV_NOPTS_VALUE ? begin : std::min(first, begin);
+        }
+    }
+    return first == AV_NOPTS_VALUE ? UsableTime(input.start_time) : first;
 }
 
 }  // namespace
@@ -77,10 +105,15 @@ SoundDecoder::SoundDecoder(Opened opened)
       isLinear_(opened.form.bitsPerChannel > 0),
       converter_(channels_, rate_) {
     const AVStream& of = *input_->streams[stream_];
-    const ncfSInt64 start = opened.hasWholeIndex ? AV_NOPTS_VALUE : UsableTime(input_->start_time);
+    const ncfSInt64 start = opened.hasWholeIndex ? AV_NOPTS_VALUE : StartOf(*input_);
     // Before 0 a movie has what primes its decoders.
     if (start != AV_NOPTS_VALUE && (start > 0 || !IsMovieFamily(*input_))) {
         zeroTime_ = Rescaled(start, AVRational{1, AV_TIME_BASE}, of.time_base);
+    }
+    const ncfSInt64 begin = UsableTime(of.start_time);
+    if (!opened.hasWholeIndex && IsMovieFamily(*input_) && begin != AV_NOPTS_VALUE) {
+        heardFrom_ = PlaceOf(begin) + Rescaled(OpusPriming(*of.codecpar), AVRational{1, 48000},
+                                               AVRational{1, rate_});
     }
     tolerance_ = 1 + 2 * av_rescale_rnd(rate_, of.time_base.num, of.time_base.den, AV_ROUND_UP);
     const int coarser = av_cmp_q(of.time_base, AVRational{1, rate_});
@@ -124,10 +157,6 @@ void SoundDecoder::Rewind() {
     if (isRunning_) {
         input_ = std::move(again);
         UseOneStream(*input_, stream_);
-        // What a decoder carries on does not go with a flush.
-        if (auto codec = SoundCodec::Open(*input_->streams[stream_], false)) {
-            codec_ = std::move(codec);
-        }
     }
 }
 
@@ -151,7 +180,9 @@ bool SoundDecoder::SeekToKnown(ncfSInt64 place) {
 }
 
 void SoundDecoder::Start(ncfSInt64 place) {
-    codec_->Flush();
+    if (auto codec = SoundCodec::Open(*input_->streams[stream_], false)) {
+        codec_ = std::move(codec);
+    }
     converter_.Forget();
     isRunning_ = true;
     isFed_ = false;
@@ -365,7 +396,7 @@ ncfUInt64 SoundDecoder::Read(ncfUInt64 place, ncfUInt64 count, std::vector<ncfSI
     }
     ncfSInt64 reached = first;
     while (true) {
-        const ncfSInt64 from = std::max(first, blockStart_);
+        const ncfSInt64 from = std::max({first, blockStart_, heardFrom_});
         const ncfSInt64 to = std::min(end, blockStart_ + blockCount_);
         if (blockCount_ > 0 && from < to) {
             std::copy_n(block_.begin() + static_cast<std::ptrdiff_t>(from - blockStart_) *

@@ -83,6 +83,7 @@ private:
     bool isLinear_;
     SoundConverter converter_;
     ncfSInt64 zeroTime_ = 0;   // of place 0, in time units of the stream
+    ncfSInt64 heardFrom_ = 0;  // place; what comes before it primes the decoder
     ncfSInt64 tolerance_ = 1;  // frames that rounding of times may take
     // How places are found where times do not give them to the frame: from the
     // index where all packets hold equally much, else by counting.

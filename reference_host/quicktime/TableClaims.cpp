@@ -211,6 +211,15 @@ private:
                                                        size < skipped ? 0 : size - skipped, 8)));
                 return;
             }
+            case Code("tkhd"):
+                numbers_.resize(static_cast<std::size_t>(tracks_));
+                if (!numbers_.empty()) {
+                    numbers_.back() = Number(position + (IsLong(position) ? 20 : 12));
+                }
+                return;
+            case Code("tfhd"):
+                fragmentOf_ = Number(position + 4);
+                return;
             case Code("trun"):
                 Add(Claim::Fragments, Number(position + 4));
                 return;
@@ -257,12 +266,20 @@ private:
         ncfUInt64& sum = sums_[static_cast<std::size_t>(claim)];
         sum += std::min(count, std::numeric_limits<ncfUInt64>::max() - sum);
         if (sum > limit_ && problem_.empty()) {
-            problem_ = (tracks_ > 0 ? "track " + std::to_string(tracks_) + ": " : std::string()) +
+            const ncfUInt64 track = claim == Claim::Fragments ? TrackOfFragment() : tracks_;
+            problem_ = (track > 0 ? "track " + std::to_string(track) + ": " : std::string()) +
                        kClaimWords[static_cast<std::size_t>(claim)] + " " + std::to_string(count) +
                        " samples" +
                        (count <= limit_ ? ", " + std::to_string(sum) + " with those before," : "") +
                        " and a file of " + std::to_string(fileLength_) + " bytes can't hold them";
         }
+    }
+
+    // The place in the file, from 1, of the track that a fragment goes on with; 0 for
+    // none that is told.
+    ncfUInt64 TrackOfFragment() const {
+        const auto found = std::find(numbers_.begin(), numbers_.end(), fragmentOf_);
+        return found == numbers_.end() ? 0 : static_cast<ncfUInt64>(found - numbers_.begin()) + 1;
     }
 
     void ReadTrack(ncfUInt64 position, ncfUInt64 end, int depth) {
@@ -360,6 +377,8 @@ private:
     TrackTables tables_;
     ncfUInt32 timeScale_ = 0;
     ncfUInt64 tracks_ = 0;
+    std::vector<ncfUInt32> numbers_;  // of the tracks, by their places in the file
+    ncfUInt32 fragmentOf_ = 0;        // the number of its track
     std::array<ncfUInt64, kClaimWords.size()> sums_{};
     std::string problem_;
 };

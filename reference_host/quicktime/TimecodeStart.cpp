@@ -28,26 +28,20 @@ bool ReadTimecodeStart(const AVStream& stream, TimecodeStart& out) {
                               &separator, &frames) != 5) {
         return false;
     }
+    // The library tells no start where the description is shorter.
+    const AVCodecParameters& form = *stream.codecpar;
+    if (!form.extradata || form.extradata_size < kDescriptionBytes) {
+        return false;
+    }
     TimecodeStart start;
     start.hours = static_cast<ncfUInt8>(hours);
     start.minutes = static_cast<ncfUInt8>(minutes);
     start.seconds = static_cast<ncfUInt8>(seconds);
     start.frames = static_cast<ncfUInt8>(frames);
-    const AVCodecParameters& form = *stream.codecpar;
-    if (form.extradata && form.extradata_size >= kDescriptionBytes) {
-        start.isDropFrame = (AV_RB32(form.extradata + 4) & kDropFrameFlag) != 0;
-        start.timeScale = AV_RB32(form.extradata + 8);
-        start.frameDuration = AV_RB32(form.extradata + 12);
-        start.framesPerSecond = form.extradata[16];
-    } else {
-        start.isDropFrame = separator == ';';
-        start.timeScale = static_cast<ncfUInt32>(stream.avg_frame_rate.num);
-        start.frameDuration = static_cast<ncfUInt32>(stream.avg_frame_rate.den);
-        start.framesPerSecond =
-            start.frameDuration > 0
-                ? (start.timeScale + start.frameDuration - 1) / start.frameDuration
-                : 0;
-    }
+    start.isDropFrame = (AV_RB32(form.extradata + 4) & kDropFrameFlag) != 0;
+    start.timeScale = AV_RB32(form.extradata + 8);
+    start.frameDuration = AV_RB32(form.extradata + 12);
+    start.framesPerSecond = form.extradata[16];
     // Nothing can be counted with a zero, of which one byte is looked at.
     if (start.timeScale == 0 || start.frameDuration == 0 || (start.framesPerSecond & 0xFF) == 0 ||
         frames > 0xFF) {

@@ -60,8 +60,11 @@ NCFRESULT CreateHostString(INCFString** out) {
     const NCFRESULT result =
         factory->CreateComponent(NCFCompID_NCFString, nullptr, IID_INCFString, &made);
     factory->Release();
+    auto* const string = static_cast<INCFString*>(made);
     if (result >= 0) {
-        *out = static_cast<INCFString*>(made);
+        *out = string;
+    } else if (string != nullptr) {
+        string->Release();
     }
     return result >= 0 && made == nullptr ? NCF_E_UNEXPECTED : result;
 }

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/xml/InputFile.h"
 
+#include <cerrno>
 #include <fstream>
 #include <system_error>
 #include <vector>
@@ -22,7 +23,9 @@ NCFRESULT Inspect(const std::filesystem::path& file, std::string& problem) {
         return NCF_E_NOTFOUND;
     }
     if (status.type() != std::filesystem::file_type::regular) {
-        problem = failure ? failure.message() : "this is no file but a folder or a device";
+        problem = failure                                                  ? failure.message()
+                  : status.type() == std::filesystem::file_type::directory ? "this is a folder"
+                                                                           : "this is no file";
         return NCF_E_HANDLE;
     }
     if (std::filesystem::file_size(file, failure) > XmlLimits::kLargestDocument && !failure) {
@@ -40,9 +43,11 @@ NCFRESULT ReadInputFile(const std::filesystem::path& file, const PieceTaker& tak
     if (usable < 0) {
         return usable;
     }
+    errno = 0;
     std::ifstream stream(file, std::ios::binary);
     if (!stream) {
-        problem = "the file can't be opened; may you read it?";
+        problem = "the file can't be opened: " +
+                  std::generic_category().message(errno != 0 ? errno : EIO);
         return NCF_E_HANDLE;
     }
     std::vector<char> piece(kPiece);

@@ -169,7 +169,6 @@ protected:
     // Rules of field order and layout that both kinds of clip apply to what
     // their movie says, and the user's choice over that.
     void ApplyFieldDetails(bool interlaced, bool topFieldFirst, bool split);
-    void ApplyUsersFields();
     // Field order and layout by the size of the picture alone.
     void ApplySizeBasedFieldDefault(ncfUInt32 width, ncfUInt32 height);
 
@@ -207,4 +206,7 @@ protected:
     NCFSmartPtr<QTWrapper::IQTAudioReader> qtAPIAudioReader_;
     NCFSmartPtr<QTWrapper::IQTVideoReader> qtAPIVideoReader_;
     NCFSmartPtr<QuickTime::IQuickTimeProperty> qtProperty_;
+
+private:
+    void ApplyUsersFields();
 };

@@ -41,13 +41,14 @@ NCFRESULT ReadWhole(const char* ncfFunction, const char* statement,
     return NCF_OK;
 }
 
-// Room behind the first range, which is the movie header, for what tracks add.
-// A long header must not be moved for them: twice its size would be held.
+// Room behind a short movie header for what tracks add.
 constexpr std::size_t kRoomForTracks = 4 * kHashChunkSize;
 
+// The first range is the movie header. A long one must not be moved for what the
+// tracks add, since both copies would be held meanwhile. So it gets as much room
+// again: where the tracks fill that too, they are most of the content.
 std::size_t NextCapacity(const std::vector<ncfUInt8>& content, std::size_t needed) {
-    return content.empty() ? needed + needed / 4 + kRoomForTracks
-                           : std::max(needed, 2 * content.capacity());
+    return content.empty() ? 2 * needed + kRoomForTracks : std::max(needed, 2 * content.capacity());
 }
 
 // How much of the content is good, however the reading ends.

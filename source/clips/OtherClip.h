@@ -78,9 +78,10 @@ private:
     // The wrapper's question about the kind of a track.
     using TrackTest = ncfBool (QTWrapper::IQuickTimeWrapper::*)(ncfUInt32);
 
-    // The highest track number that is asked about. A walk costs a question for
-    // each number, so one over more is cut off here; the count that the wrapper
-    // tells is handed on as it is.
+    // The highest track number that a walk asks about. It costs a question for each
+    // number, so one over more is cut off here. The wrapper is given room for as
+    // many lengths. GetTrackType takes any number up to the count that the wrapper
+    // tells.
     static constexpr ncfUInt32 kMostTracks = 65535;
 
     ncfUInt32 HighestTrack() const;

@@ -55,9 +55,10 @@ private:
     NMA::XMLUtils::NMAXmlElement* root_ = nullptr;  // owned by the document
 };
 
-// Reads a label of the form 8-4-4-4-12 hexadecimal digits in either case. A
-// number may have fewer digits, and what follows the last isn't looked at.
-// false, with the output untouched, where fewer than all numbers are there.
+// Reads a label of the form 8-4-4-4-12 hexadecimal digits in either case, as sscanf
+// reads numbers: one may have fewer digits, or begin with blanks, a sign or 0X,
+// which count among its digits but for the blanks. What follows the last isn't
+// looked at. false, with the output untouched, where fewer than all numbers are there.
 bool StringToGUID(const NMAString& text, GUID* out);
 
 }  // namespace ParseHelperFunctions

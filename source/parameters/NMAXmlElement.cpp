@@ -3,6 +3,7 @@
 
 #include "source/parameters/NMAXmlElement.h"
 
+#include <iterator>
 #include <memory>
 
 #include "source/parameters/NMAXmlLeaves.h"
@@ -23,24 +24,27 @@ void NMAXmlElement::SetChanged() {
     rebuildAttributeIndex();
 }
 
-// Only children that are new to their place are looked at, so building a long
-// list costs one look at each.
+// Only children that are new to their place are asked for their names, unless
+// any node has changed quietly: building a long list costs one look at each.
 void NMAXmlElement::rebuildAttributeIndex() {
     found_.reset();
-    while (!attributePlaces_.empty() && attributePlaces_.back() >= standing_) {
-        attributePlaces_.pop_back();
+    const ncfUInt64 changes = QuietChanges();
+    if (changes != indexedAtChange_) {
+        standing_ = 0;
+        indexedAtChange_ = changes;
     }
-    for (; standing_ < children_.size(); ++standing_) {
-        if (dynamic_cast<NMAXmlAttribute*>(children_[standing_])) {
-            attributePlaces_.push_back(standing_);
+    if (standing_ < indexed_) {
+        for (auto it = attributeIndex_.begin(); it != attributeIndex_.end();) {
+            it = it->second < standing_ ? std::next(it) : attributeIndex_.erase(it);
         }
+        indexed_ = standing_;
     }
-    attributeIndex_.clear();
-    for (const std::size_t place : attributePlaces_) {
-        if (children_[place]->GetState() != kDeleted) {
+    for (; indexed_ < children_.size(); standing_ = ++indexed_) {
+        auto* const attribute = dynamic_cast<NMAXmlAttribute*>(children_[indexed_]);
+        if (attribute && attribute->GetState() != kDeleted) {
             NMAString name;
-            children_[place]->GetNodeName(name);
-            attributeIndex_.emplace(name.GetUTF8String(), place);
+            attribute->GetNodeName(name);
+            attributeIndex_.emplace(name.GetUTF8String(), indexed_);
         }
     }
 }
@@ -105,8 +109,8 @@ void NMAXmlElement::SetTagName(const NMAString& name) {
         ThrowIfFailed(NCF_E_UNEXPECTED);
     }
     tagName_ = name;
-    if (auto* const parent = dynamic_cast<NMAXmlElement*>(parent_)) {
-        parent->found_.reset();
+    if (parent_) {
+        CountQuietChange();
     }
 }
 

@@ -94,13 +94,15 @@ private:
     void rebuildAttributeIndex();
 
     std::map<std::string, std::size_t> attributeIndex_;  // name to place in the list
-    std::vector<std::size_t> attributePlaces_;           // of all of them in the list
+    std::size_t indexed_ = 0;                            // how many of the first children it covers
+    ncfUInt64 indexedAtChange_ = 0;                      // QuietChanges() when it was made
     // The child that FindChild gave last: going through all by their indexes
     // steps from one to the next. Forgotten with every change.
     struct Found {
         NMAString name;
         ncfUInt32 index;
         std::size_t place;
+        ncfUInt64 atChange;  // QuietChanges() at that time
     };
     std::optional<Found> found_;
     NMAString tagName_;

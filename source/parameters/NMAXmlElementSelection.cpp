@@ -96,7 +96,8 @@ ncfUInt32 NMAXmlElement::CountChildren(const NMAString& name) {
 
 NMAXmlElement* NMAXmlElement::FindChild(const NMAString& name, ncfUInt32 index) {
     LoadChildren();
-    const bool goesOn = found_ && found_->index <= index && found_->name == name;
+    const bool goesOn = found_ && found_->atChange == QuietChanges() && found_->index <= index &&
+                        found_->name == name;
     ncfUInt32 matches = goesOn ? found_->index : 0;
     for (std::size_t place = goesOn ? found_->place : 0; place < children_.size(); ++place) {
         auto* const element = dynamic_cast<NMAXmlElement*>(children_[place]);
@@ -104,7 +105,7 @@ NMAXmlElement* NMAXmlElement::FindChild(const NMAString& name, ncfUInt32 index) 
             continue;
         }
         if (matches == index) {
-            found_ = Found{name, index, place};
+            found_ = Found{name, index, place, QuietChanges()};
             return element;
         }
         ++matches;

@@ -49,6 +49,13 @@ NMAXmlNode::~NMAXmlNode() {
     deleteChildren();
 }
 
+void NMAXmlNode::setState(State state) {
+    if ((state == kDeleted) != (state_ == kDeleted)) {
+        CountQuietChange();
+    }
+    state_ = state;
+}
+
 void NMAXmlNode::deleteChildren() {
     for (NMAXmlNode* child : children_) {
         delete child;
@@ -118,11 +125,11 @@ void NMAXmlNode::LoadChildren() {
         ThrowIfFailed(host->GetChild(i, child.outArg()));
         appendWrapped(child.inArg());
     }
-    state_ = kInStep;
+    setState(kInStep);
 }
 
 void NMAXmlNode::SetChanged() {
-    state_ = kChanged;
+    setState(kChanged);
 }
 
 void NMAXmlNode::CopyTo(NMAXmlNode& target) {
@@ -130,7 +137,7 @@ void NMAXmlNode::CopyTo(NMAXmlNode& target) {
     target.hostNode_ = hostNode_;
     target.parent_ = parent_;
     target.origin_ = origin_;
-    target.state_ = state_;
+    target.setState(static_cast<State>(state_));
     for (NMAXmlNode* child : children_) {
         std::unique_ptr<NMAXmlNode> copy = MakeAlike(*child);
         child->CopyTo(*copy);
@@ -142,12 +149,15 @@ void NMAXmlNode::CopyTo(NMAXmlNode& target) {
 
 void NMAXmlNode::Reset() {
     hostNode_ = nullptr;
-    state_ = kUnread;
+    setState(kUnread);
+    if (parent_) {
+        CountQuietChange();  // what it is filled from next has another name
+    }
     deleteChildren();
 }
 
 void NMAXmlNode::MarkDeleted() {
-    state_ = kDeleted;
+    setState(kDeleted);
 }
 
 std::size_t NMAXmlNode::findHostChild(IXmlNode* hostNode) const {
@@ -226,7 +236,7 @@ void NMAXmlNode::Refresh() {
         return;
     }
     RequireHostNode();
-    state_ = kUnread;
+    setState(kUnread);
     LoadChildren();
 }
 
@@ -241,7 +251,7 @@ void NMAXmlNode::DiscardNewChildren() {
             ++i;
         }
     }
-    state_ = kInStep;
+    setState(kInStep);
 }
 
 void NMAXmlNode::DropChildAt(std::size_t index) {

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <atomic>
 #include <vector>
 
 #include "host_interfaces/util/NMAString.h"
@@ -83,6 +84,12 @@ protected:
     // Deletes a child made in memory; marks one of the host as deleted.
     void DropChildAt(std::size_t index);
 
+    // How often, in all documents, a child got another name or came to be deleted
+    // or was brought back. Its parent isn't told, and may be gone: what a parent
+    // remembers about its children holds while this stays.
+    static ncfUInt64 QuietChanges() { return quietChanges_.load(std::memory_order_relaxed); }
+    static void CountQuietChange() { quietChanges_.fetch_add(1, std::memory_order_relaxed); }
+
     NCFSmartPtr<IXmlNode> hostNode_;
     std::vector<NMAXmlNode*> children_;  // owned
     // How many of the first children stand where a derived class last saw them.
@@ -92,10 +99,13 @@ protected:
     NMAXmlNode* parent_ = nullptr;
 
 private:
+    void setState(State state);
     void deleteChildren();
     void appendWrapped(IXmlNode* hostChild);
     void eraseChildAt(std::size_t index);
     std::size_t findHostChild(IXmlNode* hostNode) const;
+
+    inline static std::atomic<ncfUInt64> quietChanges_{0};
 };
 
 }  // namespace NMA::XMLUtils

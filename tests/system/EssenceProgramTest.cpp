@@ -40,7 +40,7 @@ TEST_F(EssenceProgram, ShowsTheSampleMapAsTextAndJson) {
     ASSERT_EQ(every["tracks"].size(), 1u);
     EXPECT_EQ(every["tracks"][0]["map"].size(), every["tracks"][0]["samples"]);
     ExpectSays(RunCliphost("samples --track 7 " + movie), 2,
-               "there is no track 7; its tracks are 0 picture, 1 sound");
+               "there is no track 7; its tracks are 0 (picture), 1 (sound)");
 }
 
 // The offset of a picture can't be found where the durations are uneven.

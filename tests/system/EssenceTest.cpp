@@ -52,6 +52,52 @@ constexpr const char* kPictures[] = {"h264_bframes.mov",
                                      "one_picture.mov",
                                      "three_sounds.mov"};
 
+// Asked sample by sample, the module says what the program works out at once, also
+// where pictures are displayed far away or nowhere.
+void ExpectOffsetsOfTheModule(Essence& essence) {
+    const ClipTrack& track = *essence.First(TrackKind::Picture);
+    const auto worked =
+        cliphost::WorkOutOffsets(cliphost::DisplayTimesOf(essence.movie(), essence.Which(track)));
+    ncfUInt64 count = 0;
+    ASSERT_EQ(essence.map().GetNumberOfSamples(track.number, &count), NCF_OK);
+    ASSERT_EQ(worked.size(), count);
+    for (ncfUInt64 i = 0; i < count; ++i) {
+        ASSERT_EQ(worked[i], cliphost::AskOffset(essence.map(), track.number, i)) << i;
+    }
+}
+
+TEST_F(EssenceMap, FindsTheOffsetsThatTheModuleTellsOneByOne) {
+    movies::VideoFormat format;
+    format.codec = "mp4v";
+    for (const std::int32_t step : {0, 1, 7, 450, 1001, -333}) {
+        SCOPED_TRACE(step);
+        movies::Movie movie;
+        movie.tracks.push_back(movies::VideoTrack(format, 0, 25000, 1000, 10));
+        for (std::int32_t i = 0; i < 300; ++i) {
+            movies::SampleRun run;
+            run.size = 10;
+            run.duration = i % 50 == 3 ? 900 : 1000;
+            run.displayOffset = (i * 37 % 11) * 1000 + i * step;
+            movie.tracks[0].samples.push_back(run);
+        }
+        movie.tracks[0].offsetVersion = 1;
+        Essence essence(session(), Write(movie, std::to_string(step) + ".mov"));
+        ExpectOffsetsOfTheModule(essence);
+    }
+}
+
+TEST_F(EssenceMap, FindsTheOffsetsOfMoviesThatTheLibraryReads) {
+    const auto movie = folder() / "fragments.mp4";
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=160x90:r=25:d=4 -vf "
+                         "'setpts=(N+N*N/8)/25/TB' -vsync passthrough -c:v libx264 -bf 3 "
+                         "-pix_fmt yuv420p -movflags frag_keyframe+empty_moov " +
+                         Quoted(movie))
+                  .status,
+              0);
+    Essence essence(session(), movie);
+    ExpectOffsetsOfTheModule(essence);
+}
+
 TEST_F(EssenceMap, TellsWhereEveryPictureLies) {
     for (const char* const name : kPictures) {
         SCOPED_TRACE(name);
@@ -140,6 +186,38 @@ TEST_F(EssenceMap, OfPcmHoldsThePacketsOneBehindTheOther) {
             samples += runs.runs[i].count;
         }
         EXPECT_EQ(samples, runs.samples);
+    }
+}
+
+// A header counts sound that is coded in blocks frame by frame, so each frame has
+// the place of its block, and all of them are one run here.
+TEST_F(EssenceMap, OfBlocksOfSoundHoldsEachBlockOnce) {
+    for (const char* const codec : {"adpcm_ima_wav", "adpcm_ms"}) {
+        SCOPED_TRACE(codec);
+        const auto movie = folder() / (std::string(codec) + ".mov");
+        ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=440:d=1 -ac 2 -c:a " +
+                             std::string(codec) + " " + Quoted(movie))
+                      .status,
+                  0);
+        const auto packets = PacketsOf(movie, "a:0");
+        ASSERT_GT(packets.size(), 10u);
+        Essence essence(session(), movie);
+        const auto runs = cliphost::ReadRuns(essence.map(), 0, std::filesystem::file_size(movie));
+        EXPECT_TRUE(runs.faults.empty());
+        ASSERT_EQ(runs.runs.size(), 1u);
+        EXPECT_EQ(runs.runs[0].count, runs.samples);
+        EXPECT_EQ(runs.runs[0].position, packets.front().position);
+        EXPECT_EQ(runs.bytes, std::accumulate(packets.begin(), packets.end(), std::uint64_t{0},
+                                              [](std::uint64_t sum, const Packet& packet) {
+                                                  return sum + packet.size;
+                                              }));
+        const auto inBlock = static_cast<std::uint64_t>(packets[1].time - packets[0].time);
+        for (std::size_t i = 0; i < packets.size(); ++i) {
+            cliphost::MappedSample sample;
+            ASSERT_EQ(cliphost::ReadMappedSample(essence.map(), 0, i * inBlock, sample), NCF_OK);
+            EXPECT_EQ(sample.position, packets[i].position) << i;
+            EXPECT_EQ(sample.size, packets[i].size) << i;
+        }
     }
 }
 

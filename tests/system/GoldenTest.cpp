@@ -41,6 +41,10 @@ struct GoldenMovie {
     bool useAlpha;
 };
 
+void PrintTo(const GoldenMovie& movie, std::ostream* to) {
+    *to << movie.movie;
+}
+
 class Golden : public SystemTest, public testing::WithParamInterface<GoldenMovie> {};
 
 TEST_P(Golden, TreeIsAsReviewed) {

@@ -5,6 +5,7 @@
 // What is expected follows from the command that made the movie, and was
 // compared with what ffprobe says of it.
 
+#include "reference_host/util/text/FileUrl.h"
 #include "tests/system/Facts.h"
 #include "tests/system/KnownPictures.h"
 #include "tests/system/SystemTest.h"
@@ -82,6 +83,10 @@ struct Profile {
     const char* name;
     const char* code;
 };
+
+void PrintTo(const Profile& profile, std::ostream* to) {
+    *to << profile.code;
+}
 
 class ProRes : public SystemTest, public testing::WithParamInterface<Profile> {};
 
@@ -373,8 +378,9 @@ TEST_F(MadeMovies, WithAlphaHaveOnePictureWhenTheHostIgnoresIt) {
 TEST_F(MadeMovies, NameTheirFileInTheLocators) {
     const auto movie = MadeMovie("png.mov");
     const cliphost::TreeNode tree = Describe(movie);
-    EXPECT_EQ(Url(tree, kFileMob), "file://" + movie.string());
-    EXPECT_EQ(Url(tree, kSourceMob), "file://" + movie.string());
+    const std::string url = host::text::FileUrl(movie.string());
+    EXPECT_EQ(Url(tree, kFileMob), url);
+    EXPECT_EQ(Url(tree, kSourceMob), url);
     EXPECT_EQ(Fact(Mob(tree, kMasterMob), "Name"), "\"png\"");
 }
 

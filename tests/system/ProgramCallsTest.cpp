@@ -68,8 +68,17 @@ TEST_F(ProgramCalls, GoOnAfterADescriptionThatCantBeSaved) {
     const auto second = Copy("png.mov", "b.mov");
     std::filesystem::create_directories(folder() / "out" / "a.aaf");
     ExpectSays(RunCliphost("describe -q --out-dir " + Out("out") + " " + first + " " + second), 2,
-               "a.aaf: not saved: a folder is there");
+               "a.aaf: not written: Is a directory; a folder is there");
     EXPECT_TRUE(std::filesystem::is_regular_file(folder() / "out" / "b.aaf"));
+}
+
+TEST_F(ProgramCalls, LeaveNoEmptyFolderBehind) {
+    std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "a.mov");
+    std::filesystem::resize_file(folder() / "a.mov", 20);
+    EXPECT_EQ(RunCliphost("describe -q --out-dir " + Out("out/in") + " " + Out("a.mov")).status, 1);
+    EXPECT_FALSE(std::filesystem::exists(folder() / "out"));
+    EXPECT_NE(RunCliphost("frame -o " + Out("out") + " " + Out("a.mov")).status, 0);
+    EXPECT_FALSE(std::filesystem::exists(folder() / "out"));
 }
 
 TEST_F(ProgramCalls, GiveEachDescriptionAFileOfItsOwn) {
@@ -91,7 +100,7 @@ TEST_F(ProgramCalls, LeaveAForeignFileOfASimilarNameAlone) {
 TEST_F(ProgramCalls, SaveDescriptionsInFoldersThatAreThere) {
     const auto movie = Copy("png.mov", "a.mov");
     ExpectSays(RunCliphost("describe -q " + movie + " --aaf " + Out("no/a.aaf")), 2,
-               "there is no folder");
+               "a.aaf: not written: No such file or directory; make the folder ");
     ExpectSays(RunCliphost("describe -q " + movie + " --out-dir " + movie), 2,
                "the folder can't be made");
     EXPECT_EQ(FilesLeft(), 1u);
@@ -171,7 +180,9 @@ TEST_F(ProgramCalls, TellWhenStandardOutputTakesNothing) {
     const CommandResult amid = RunCommand(Program() + " samples --every " +
                                           Quoted(MadeMovie("pcm_u8.mov")) + " 2>&1 >/dev/full");
     EXPECT_EQ(amid.status, 2);
-    EXPECT_EQ(amid.out, "cliphost: standard output: not written: No space left on device\n");
+    EXPECT_EQ(amid.out,
+              "cliphost: standard output: not written: No space left on device; make room there or "
+              "name another place\n");
     EXPECT_EQ(RunCommand(Program() + " describe missing.mov 2>/dev/full").status, 2);
 }
 
@@ -181,6 +192,45 @@ TEST_F(ProgramCalls, PrintIntoNoFileWhenStandardStreamsAreClosed) {
     ASSERT_EQ(RunCommand(Program() + " audio " + movie + " -o " + Out("open.wav")).status, 0);
     RunCommand(Program() + " audio " + movie + " -o " + Out("closed.wav") + " <&- >&- 2>&-");
     EXPECT_EQ(ReadFile(folder() / "closed.wav"), ReadFile(folder() / "open.wav"));
+}
+
+// Also of what fails before any movie is read.
+TEST_F(ProgramCalls, AnswerAFailureInJsonWhateverTheVerb) {
+    const auto movie = Quoted(MadeMovie("png.mov"));
+    for (const std::string& call :
+         {"scan --json " + Out("."), "describe --json " + movie, "samples --json " + movie,
+          "formats --json " + movie, "params --json " + movie, std::string("types --json"),
+          std::string("plugin --json")}) {
+        const CommandResult ran =
+            RunCommand(Program() + " " + call + " --plugin " + Out("no.nvx") + " 2>/dev/null");
+        EXPECT_EQ(ran.status, 2) << call;
+        const Json answer = Json::parse(ran.out, nullptr, false);
+        ASSERT_TRUE(answer.is_structured()) << call << "\n" << ran.out;
+        const Json problem = answer.is_array() ? answer.at(0) : answer;
+        EXPECT_NE(problem["reason"].get<std::string>().find("no.nvx"), std::string::npos) << call;
+        EXPECT_EQ(problem["hint"], "name another with --plugin FILE") << call;
+        EXPECT_EQ(problem["code"], "NCF_E_NOTFOUND") << call;
+        EXPECT_TRUE(problem["route"].is_null()) << call;
+    }
+}
+
+TEST_F(ProgramCalls, TellInJsonWhyAMovieIsMappedWithoutADescription) {
+    // Too short for a frame.
+    const std::string movie = Out("short.mov");
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=r=48000 -af atrim=end_sample=1 "
+                         "-c:a pcm_s16le " +
+                         movie)
+                  .status,
+              0);
+    const CommandResult ran = RunCommand(Program() + " formats --json " + movie + " 2>/dev/null");
+    EXPECT_EQ(ran.status, 0);
+    const Json answer = Json::parse(ran.out);
+    EXPECT_TRUE(answer["reason"].is_string()) << ran.out;
+    EXPECT_TRUE(answer["tracks"][0]["rate"].is_null()) << ran.out;
+    const Json whole =
+        Json::parse(RunCliphost("formats --json " + Quoted(MadeMovie("png.mov"))).out);
+    EXPECT_FALSE(whole.contains("reason"));
+    EXPECT_EQ(whole["tracks"][0]["rate"], "25/1");
 }
 
 TEST_F(ProgramCalls, GiveValidJsonForNamesThatAreNoUtf8) {

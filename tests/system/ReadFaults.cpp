@@ -12,8 +12,10 @@
 
 #include <atomic>
 #include <cerrno>
+#include <climits>
 #include <cstdarg>
 #include <cstdio>
+#include <cstdlib>
 #include <cstring>
 
 namespace read_faults {
@@ -108,9 +110,11 @@ __attribute__((visibility("default"))) off64_t lseek64(int descriptor, off64_t o
     return SeekOr(descriptor, offset, origin);
 }
 
+// The path may lead to the file by links.
 static bool RefusesOpening(const char* path) {
-    return armed == Fault::kOpenFails && std::strcmp(path, read_faults::file) == 0 &&
-           read_faults::Fails();
+    char whole[PATH_MAX];
+    return armed == Fault::kOpenFails && realpath(path, whole) &&
+           std::strcmp(whole, read_faults::file) == 0 && read_faults::Fails();
 }
 
 __attribute__((visibility("default"))) int open(const char* path, int flags, ...) {

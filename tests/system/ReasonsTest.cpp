@@ -125,6 +125,71 @@ INSTANTIATE_TEST_SUITE_P(
         Case{"LongPictures", TwoLongPictures, "describe -q",
              "cliphost: a.mov: track 1 of the file: 2 pictures in 7200 seconds come to no rate of "
              "frames; the sound alone can be had: cliphost audio FILE --rate 48000 -o FILE.wav"},
+        Case{"OneEndlessPicture",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 29, 30, 1));
+                 movie.tracks[0].samples.push_back({1, 1000, 0x7FFFFFFF});
+                 movie.tracks[0].mediaDuration = 30;
+                 movie.tracks[0].trackDuration = 600;
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1 of the file: 30 pictures in 71582789 seconds come to no "
+             "rate of frames: sample 29 of its table alone lasts 71582788 seconds, 'mdhd' tells 1 "
+             "second of all"},
+        Case{"NoTimes",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 0));
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1 of the file: neither its samples nor its headers tell how "
+             "long it lasts"},
+        Case{"NoTimesBesideARefusal",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 1));
+                 movie.tracks[0].replaced = {movies::Box("stts").Version(0).U32(0)};
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 1: 'stts' counts 0 samples, the track has 30 (at byte 490)"},
+        Case{"EditsThatShowNothing",
+             [] {
+                 movies::Movie movie = movies::Movie();
+                 movies::VideoFormat format;
+                 format.codec = "raw ";
+                 format.width = format.height = 8;
+                 movie.tracks = {movies::VideoTrack(format, 30, 30, 1, 192)};
+                 movie.tracks[0].edits = {{600, -1, 1.0}};
+                 return movies::Build(movie).ToBytes();
+             },
+             "frame -o o.png",
+             "cliphost: a.mov: track 1 of the file: its edits show none of its 30 samples"},
+        Case{"SoundThatIsAPicture",
+             [] {
+                 movies::VideoFormat format;
+                 format.codec = "jpeg";
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 1));
+                 movie.tracks.push_back(movies::VideoTrack(format, 30, 30, 1));
+                 movie.tracks[1].handler = "soun";
+                 return movies::Build(movie).ToBytes();
+             },
+             "describe -q",
+             "cliphost: a.mov: track 2 of the file: its sound, 'jpeg', has no channels"},
+        Case{"SoundWithoutSamples",
+             [] {
+                 movies::Movie movie =
+                     OneTrack(movies::VideoTrack(movies::VideoFormat(), 30, 30, 1));
+                 movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 0));
+                 movie.tracks[1].mediaDuration = 48000;
+                 movie.tracks[1].trackDuration = 600;
+                 return movies::Build(movie).ToBytes();
+             },
+             "audio -o o.wav", "cliphost: a.mov: track 2 of the file: it holds no samples"},
         Case{"EncryptedPicture", [] { return WithCode(Made("png.mov"), "png ", "encv"); },
              "frame -o o.png",
              "cliphost: a.mov: track 1 of the file: its samples are encrypted "
@@ -254,6 +319,102 @@ TEST_F(Reasons, TellWhyAMovieIsReadTheSecondWay) {
     const Json& other = parsed.is_array() ? parsed[0] : parsed;
     EXPECT_EQ(other["route"], "header");
     EXPECT_FALSE(other.contains("routeReason"));
+}
+
+// The parser takes the header; the module makes no clip of a picture without size.
+TEST_F(Reasons, TellThatNoClipIsMadeOfAHeaderThatIsRead) {
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=64x48 -frames:v 1 " +
+                         In("a.jpg"))
+                  .status,
+              0);
+    const movies::Bytes picture = ReadFile(folder() / "a.jpg");
+    movies::VideoFormat format;
+    format.codec = "jpeg";
+    format.width = 0;
+    format.height = 48;
+    movies::Movie movie =
+        OneTrack(movies::VideoTrack(format, 2, 25, 1, static_cast<std::uint32_t>(picture.size())));
+    for (int i = 0; i < 2; ++i) {
+        movies::Bytes& data = movie.tracks[0].data;
+        data.insert(data.end(), picture.begin(), picture.end());
+    }
+    const CommandResult json =
+        RunCommand(Quoted(ProgramFolder() / "cliphost") + " describe --json " +
+                   Quoted(Write(movie)) + " 2>/dev/null");
+    const Json entry = Json::parse(json.out);
+    const Json& one = entry.is_array() ? entry[0] : entry;
+    EXPECT_EQ(one["route"], "library");
+    EXPECT_EQ(one.value("routeReason", ""), "track 1 of the file: 'jpeg' tells a size of 0 x 48");
+}
+
+// The library opens these, and makes no clip of them.
+TEST_F(Reasons, KeepWhatTheHeaderParserSays) {
+    Write(WithCode(Made("png.mov"), "stsd", "xxxx"), "a.mov");
+    const CommandResult told = RunCliphost("describe -q " + In("a.mov"));
+    ExpectSays(told, 1, "track 1: it lacks 'stsd', the sample descriptions (at byte ");
+    EXPECT_EQ(told.out.find("no more is known"), std::string::npos) << told.out;
+    EXPECT_EQ(told.out.find("no decoder"), std::string::npos) << told.out;
+}
+
+TEST_F(Reasons, TellWhyATrackHasNoFrames) {
+    Write(WithCode(Made("png.mov"), "stco", "xxxx"), "a.mov");
+    ExpectSays(RunCliphost("frame -o " + In("o.png") + " " + In("a.mov")), 1,
+               "track 1: it lacks 'stco', the places of its chunks");
+    ExpectSays(RunCliphost("describe -q " + In("a.mov")), 1,
+               "track 1: it lacks 'stco', the places of its chunks");
+}
+
+TEST_F(Reasons, TellThatSoundIsEncryptedOrHasNoDecoder) {
+    Write(WithCode(Made("pcm_s16be.mov"), "twos", "enca"), "a.mov");
+    ExpectSays(RunCliphost("audio -o " + In("o.wav") + " " + In("a.mov")), 1,
+               "its samples are encrypted ('enca'); only who holds the key can read them");
+    Write(WithCode(Made("pcm_s16be.mov"), "twos", "xyz1"), "b.mov");
+    ExpectSays(RunCliphost("audio -o " + In("o.wav") + " " + In("b.mov")), 1,
+               "no decoder is known for its codec 'xyz1'");
+}
+
+TEST_F(Reasons, CountFramesThatACutFileLacks) {
+    const auto front = folder() / "front.mov";
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc=d=4:r=25:s=64x64 -c:v "
+                         "libx264 -pix_fmt yuv420p -movflags +faststart " +
+                         Quoted(front))
+                  .status,
+              0);
+    const movies::Bytes bytes = ReadFile(front);
+    Write(CutAt(bytes, bytes.size() * 3 / 4), "cut.mov");
+    const std::string words = "are missing or cut off; copy the file again";
+    ExpectSays(RunCliphost("frame --frame 98 -o " + In("o.png") + " " + In("cut.mov")), 1, words);
+    ExpectSays(RunCliphost("frame --range 0: -o " + In("all") + " " + In("cut.mov")), 1, words);
+    ExpectSays(RunCliphost("frame --frame 100 -o " + In("o.png") + " " + In("cut.mov")), 2,
+               "there is no frame 100; it has 100 frames, 0 to 99");
+    ExpectSays(RunCliphost("samples " + In("cut.mov")), 1, words);
+}
+
+TEST_F(Reasons, TellTheRouteInEveryVerb) {
+    const std::string movie =
+        " " + Quoted(std::filesystem::path(CLIPHOST_TYPE_FILES) / "fragmented.mp4");
+    const std::string words = "read by the multimedia library, since the header parser refuses it";
+    for (const char* const verb : {"formats", "samples", "params"}) {
+        ExpectSays(RunCliphost(std::string("-v ") + verb + movie), 0, words);
+        const CommandResult json = RunCommand(Quoted(ProgramFolder() / "cliphost") + " " + verb +
+                                              " --json" + movie + " 2>/dev/null");
+        const Json answer = Json::parse(json.out);
+        EXPECT_EQ(answer["route"], "library") << verb;
+        EXPECT_NE(answer["routeReason"].get<std::string>().find("fragmented"), std::string::npos);
+    }
+    ExpectSays(RunCliphost("-v frame -o " + In("o.png") + movie), 0, words);
+}
+
+TEST_F(Reasons, TellOfLinksInAFolder) {
+    std::filesystem::create_directory(folder() / "in");
+    std::filesystem::create_symlink("gone.mov", folder() / "in/a.mov");
+    const std::string words = "/in/a.mov leads to gone.mov, which is not there";
+    const CommandResult alone = RunCliphost("scan " + In("in"));
+    ExpectSays(alone, 1, words);
+    EXPECT_EQ(alone.out.find("no file there is named"), std::string::npos) << alone.out;
+    std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "in/b.mov");
+    ExpectSays(RunCliphost("scan " + In("in")), 2, words);
+    ExpectSays(RunCliphost("describe -q " + In("in")), 2, words);
 }
 
 }  // namespace

@@ -78,6 +78,14 @@ protected:
                 << count << " from " << at;
         }
     }
+    // `got` is a piece of one channel's `whole`, from `frame` on.
+    static void ExpectIn(const EssenceBytes& whole, const EssenceBytes& got, std::size_t frame) {
+        ASSERT_GE(whole.size(), frame * 3 + got.size());
+        const auto from = whole.begin() + static_cast<std::ptrdiff_t>(frame * 3);
+        const auto differs = std::mismatch(got.begin(), got.end(), from);
+        EXPECT_TRUE(differs.first == got.end())
+            << "from frame " << (differs.first - got.begin()) / 3;
+    }
     // `wanted` may go on behind the clip's length, by less than an edit unit.
     static void ExpectSame(const EssenceBytes& got, const EssenceBytes& wanted) {
         ASSERT_GE(got.size(), 1000u);
@@ -91,6 +99,20 @@ protected:
 // Clips of sound alone last whole edit units, of which the session has 25 a second.
 std::size_t InEditUnits(double seconds, std::size_t rate) {
     return static_cast<std::size_t>(seconds * 25) * rate / 25;
+}
+
+// The high byte of a sample of 24 bits.
+int HighByte(const EssenceBytes& sound, std::size_t sample) {
+    return static_cast<signed char>(sound.at(sample * 3 + 2));
+}
+
+// How often the samples of a range rise through zero.
+int RisesIn(const EssenceBytes& sound, std::size_t from, std::size_t count) {
+    int rises = 0;
+    for (std::size_t i = from; i < from + count; ++i) {
+        rises += HighByte(sound, i) < 0 && HighByte(sound, i + 1) >= 0;
+    }
+    return rises;
 }
 
 constexpr char kHum[] = "-f lavfi -i sine=440:d=1:sample_rate=";
@@ -190,14 +212,11 @@ TEST_F(SoundForms, ThatChangeTheRateOnTheWayAreResampled) {
     // A second out of the middle of the second half rises through zero a
     // thousand times, at the level of the first.
     const std::size_t from = first.size() * 1152 + 22050;
-    int rises = 0;
     int loudest = 0;
     for (std::size_t i = from; i < from + 44100; ++i) {
-        const auto high = [&](std::size_t at) { return static_cast<signed char>(got[at * 3 + 2]); };
-        rises += high(i) < 0 && high(i + 1) >= 0;
-        loudest = std::max(loudest, std::abs(static_cast<int>(high(i))));
+        loudest = std::max(loudest, std::abs(HighByte(got, i)));
     }
-    EXPECT_NEAR(rises, 1000, 1);
+    EXPECT_NEAR(RisesIn(got, from, 44100), 1000, 1);
     EXPECT_NEAR(loudest, 16, 1);  // an eighth of full scale
     ExpectRangesOf(movie, got);
 }
@@ -219,7 +238,12 @@ TEST_F(SoundForms, OfAnnouncedExtensionsOfAacAreThoseThatComeOut) {
           Kind{"bands, told behind, no stereo", {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x00}, "1"},
           Kind{"stereo, told behind", {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x80}, "2"},
           Kind{"bands, told in front", {0x2B, 0x8A, 0x08, 0x00}, "2"},
-          Kind{"stereo, told in front", {0xEB, 0x8A, 0x08, 0x00}, "2"}}) {
+          Kind{"stereo, told in front", {0xEB, 0x8A, 0x08, 0x00}, "2"},
+          // The extension names 24000, between the core's rate and twice that.
+          Kind{"bands of an odd rate, told in front", {0x2B, 0x8B, 0x08, 0x00}, "2"},
+          Kind{"bands of an odd rate, told behind", {0x13, 0x88, 0x56, 0xE5, 0xB0}, "2"},
+          // 96000, more than twice the core's.
+          Kind{"bands of a high rate, told in front", {0x2B, 0x88, 0x08, 0x00}, "2"}}) {
         for (const bool isWave : {false, true}) {
             SCOPED_TRACE(kind.name + std::string(isWave ? " in wave" : ""));
             movies::SoundFormat format = Mpeg4Sound(0x40, kind.config, 2, 22050);
@@ -255,12 +279,7 @@ TEST_F(SoundForms, OfExtensionsOfAacThatNothingAnnouncesAreThoseOfTheCore) {
     EXPECT_EQ(said.length, std::to_string(InEditUnits(seconds, 22050)));
     const EssenceBytes got = Delivered(movie);
     ASSERT_EQ(got.size(), InEditUnits(seconds, 22050) * 3);
-    int rises = 0;
-    for (std::size_t i = 11025; i < 11025 + 22050; ++i) {
-        const auto high = [&](std::size_t at) { return static_cast<signed char>(got[at * 3 + 2]); };
-        rises += high(i) < 0 && high(i + 1) >= 0;
-    }
-    EXPECT_NEAR(rises, 440, 1);
+    EXPECT_NEAR(RisesIn(got, 11025, 22050), 440, 1);
     ExpectRangesOf(movie, got);
 }
 
@@ -298,17 +317,7 @@ TEST_F(SoundForms, HaveTheRateOfTheFieldsWhateverThePacketsHave) {
     const double seconds = static_cast<double>(packets.size()) * 1152 / 44100;
     EXPECT_EQ(said.length, std::to_string(InEditUnits(seconds, 48000)));
     const EssenceBytes got = Delivered(movie);
-    const auto rises = [&](std::size_t from, std::size_t to) {
-        int count = 0;
-        for (std::size_t i = from; i + 1 < to; ++i) {
-            const auto high = [&](std::size_t at) {
-                return static_cast<signed char>(got.at(at * 3 + 2));
-            };
-            count += high(i) < 0 && high(i + 1) >= 0;
-        }
-        return count;
-    };
-    EXPECT_NEAR(rises(4800, 4800 + 24000), 220, 1);
+    EXPECT_NEAR(RisesIn(got, 4800, 24000), 220, 1);
     ExpectRangesOf(movie, got);
 }
 
@@ -334,41 +343,56 @@ TEST_F(SoundForms, KeepAGapWhileTheRateIsConverted) {
     EXPECT_FALSE(isSilent(18 * 1024 + 22050, 19 * 1024 + 22050));
 }
 
-// The edit begins within a packet: what is left of that one is followed by the
-// next as it is in the whole.
-TEST_F(SoundForms, AreContinuousFromAnEditWithinAPacket) {
+// The edit begins within a packet, in units that are the sound's frames or not:
+// what is heard is what the media holds from there on, from its first frame.
+TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditWithinAPacket) {
     const auto plain =
         Make("-f lavfi -i sine=440:d=3:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
     const SoundPackets packets = SoundPacketsOf(plain);
     const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
     const EssenceBytes whole =
-        Delivered(WriteSound(SoundTrackOf(packets, format, 48000, 1115), "whole.mov"));
-    for (const std::int64_t start : {1500, 1800, 2230, 3000}) {
+        Delivered(WriteSound(SoundTrackOf(packets, format, 44100, 1024), "whole.mov"));
+    struct Units {
+        std::uint32_t scale, packet;
+    };
+    for (const Units& units : {Units{48000, 1115}, Units{44100, 1024}}) {
+        for (const std::int64_t start : {1, 500, 1023, 1114, 1115, 1500, 1800, 2230, 3000}) {
+            SCOPED_TRACE(std::to_string(start) + " of " + std::to_string(units.scale));
+            movies::Track track = SoundTrackOf(packets, format, units.scale, units.packet);
+            movies::Edit edit;
+            edit.duration = 2 * 44100;
+            edit.mediaTime = start;
+            track.edits = {edit};
+            const auto movie = WriteSound(track, "cut.mov");
+            const EssenceBytes got = Delivered(movie);
+            ASSERT_EQ(got.size(), 2u * 44100 * 3);
+            const std::int64_t frame = (start * 44100 + units.scale / 2) / units.scale;
+            ExpectIn(whole, got, static_cast<std::size_t>(frame));
+            ExpectRangesOf(movie, got);
+        }
+    }
+}
+
+// The units are those of the core, of which the decoder makes two frames each.
+TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditInUnitsOfTheCore) {
+    const auto plain =
+        Make("-f lavfi -i sine=440:d=3:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
+    const SoundPackets packets = SoundPacketsOf(plain);
+    const movies::SoundFormat format =
+        Mpeg4Sound(0x40, {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x00}, 1, 22050);
+    const EssenceBytes whole =
+        Delivered(WriteSound(SoundTrackOf(packets, format, 22050, 1024), "whole.mov"));
+    for (const std::int64_t start : {500, 1024, 2624}) {
         SCOPED_TRACE(start);
-        movies::Track track = SoundTrackOf(packets, format, 48000, 1115);
+        movies::Track track = SoundTrackOf(packets, format, 22050, 1024);
         movies::Edit edit;
         edit.duration = 2 * 44100;
         edit.mediaTime = start;
         track.edits = {edit};
         const auto movie = WriteSound(track, "cut.mov");
         const EssenceBytes got = Delivered(movie);
-        ASSERT_GE(got.size(), 40u * 1024 * 3);
-        // Behind the first packets, on which the start of decoding tells.
-        const auto piece = got.begin() + 6000 * 3;
-        const auto found = std::search(whole.begin(), whole.end(), piece, piece + 90);
-        ASSERT_NE(found, whole.end());
-        EXPECT_NEAR(static_cast<double>(found - whole.begin()) / 3 - 6000,
-                    static_cast<double>(start) * 44.1 / 48, 3);
-        const std::size_t count =
-            std::min<std::size_t>(static_cast<std::size_t>(got.end() - piece),
-                                  static_cast<std::size_t>(whole.end() - found));
-        EXPECT_TRUE(std::equal(piece, piece + static_cast<std::ptrdiff_t>(count), found));
-        const auto isHeard = [&](std::size_t i) {
-            return got[i * 3] || got[i * 3 + 1] || got[i * 3 + 2];
-        };
-        for (std::size_t i = 1000; i < 6000; ++i) {
-            EXPECT_TRUE(isHeard(i) || isHeard(i + 1)) << "a gap at " << i;
-        }
+        ASSERT_EQ(got.size(), 2u * 44100 * 3);
+        ExpectIn(whole, got, static_cast<std::size_t>(start * 2));
         ExpectRangesOf(movie, got);
     }
 }
@@ -478,6 +502,70 @@ TEST_F(SoundForms, OfFragmentsAreThoseOfTheDescriptionInUse) {
     ExpectSame(got, wanted);
 }
 
+// A movie in fragments has an edit that leaves out what primes the decoder, or
+// nothing but the decoder's configuration tells of it. A picture that begins with
+// the priming keeps its distance to the sound.
+TEST_F(SoundForms, InFragmentsAreWithoutThePrimingOfOpus) {
+    struct Kind {
+        const char* flags;
+        const char* picture;
+        std::size_t silence;
+    };
+    const char* const picture = "-f lavfi -i testsrc=d=2:s=64x64:r=25 -c:v mpeg4 ";
+    for (const Kind& kind : {Kind{"empty_moov", "", 0}, Kind{"delay_moov", "", 0},
+                             Kind{"empty_moov", picture, 312}, Kind{"delay_moov", picture, 0}}) {
+        SCOPED_TRACE(kind.flags + std::string(kind.picture));
+        const auto movie =
+            Make("-f lavfi -i sine=440:b=4:d=2:sample_rate=48000 " + std::string(kind.picture) +
+                     "-c:a libopus -movflags frag_keyframe+" + kind.flags,
+                 "fragments.mp4");
+        const CommandResult heard = RunCommand("ffmpeg -nostdin -v quiet -i " + Quoted(movie) +
+                                               " -f s24le -c:a pcm_s24le -");
+        EssenceBytes wanted(kind.silence * 3);
+        wanted.insert(wanted.end(), heard.out.begin(), heard.out.end());
+        ExpectSame(Delivered(movie), wanted);
+    }
+}
+
+// Blocks that say they hold no data: the ffmpeg command gives no sound for them
+// either, and no file of silence is left.
+TEST_F(SoundForms, OfTelephoneBlocksWithoutDataAreRefused) {
+    movies::SoundFormat format;
+    format.codec = "samr";
+    format.channels = 1;
+    format.rate = 8000;
+    const auto movie = WriteSound(
+        SoundTrackOf(SoundPackets(50, Bytes(50, 0x7C)), format, 8000, 8000), "empty.mov");
+    const auto wav = folder() / "a.wav";
+    ExpectSays(RunCliphost("audio " + Quoted(movie) + " -o " + Quoted(wav)), 1,
+               "none of its samples from 0 to 399999 could be read");
+    EXPECT_FALSE(std::filesystem::exists(wav));
+    EXPECT_EQ(RunCommand("ffmpeg -nostdin -v quiet -i " + Quoted(movie) + " -f s16le -").out, "");
+}
+
+// Each description tells of one channel, each packet holds two: together they are
+// more than a movie may have, and the reason is told by whatever verb.
+TEST_F(SoundForms, ThatTakeMoreChannelsTogetherThanAreToldAreRefused) {
+    const auto two = Make(kHum + std::string("44100 -ac 2 -c:a libmp3lame -write_xing 0 "
+                                             "-id3v2_version 0"),
+                          "two.mp3");
+    movies::SoundFormat format;
+    format.codec = ".mp3";
+    format.channels = 1;
+    format.rate = 44100;
+    movies::Movie movie;
+    movie.timeScale = 44100;
+    SoundPackets packets = SoundPacketsOf(two);
+    packets.resize(8);
+    movie.tracks.assign(513, SoundTrackOf(packets, format, 44100, 1152));
+    const auto path = Write(movie, "many.mov");
+    for (const char* const verb : {"describe ", "formats ", "samples "}) {
+        ExpectSays(RunCliphost(verb + Quoted(path)), 1,
+                   "many.mov: the multimedia library, which decodes it, refuses it: the sounds of "
+                   "the movie have more than 1024 channels together");
+    }
+}
+
 // Linear sound of the ISO forms is read by the host itself where its depth is
 // one that the host takes, and comes bit for bit out of the provider.
 TEST_F(SoundForms, OfIsoLinearSoundAreLinear) {
@@ -499,23 +587,27 @@ TEST_F(SoundForms, OfIsoLinearSoundAreLinear) {
         const auto raw = Make(
             "-f lavfi -i sine=440:d=0.2:sample_rate=48000 -ac 2 -f " + std::string(kind.source),
             "raw");
-        movies::SoundFormat format;
-        format.codec = kind.codec;
-        format.bits = kind.bits;
-        format.extensions = {
-            movies::Box("pcmC").Version(0).U8(kind.isLittle ? 1 : 0).U8(kind.bits)};
-        movies::Track track = movies::SoundTrack(format, 9600);
-        track.samples[0].size = kind.bits / 8 * 2;
-        track.data = ReadFile(raw);
-        ASSERT_EQ(track.data.size(), 9600u * kind.bits / 8 * 2);
-        const auto movie = WriteSound(track, "linear.mov");
-        const std::string line = SoundLine(Describe(movie));
-        EXPECT_EQ(line.substr(0, std::string(kind.label).size()), kind.label) << line;
-        EXPECT_NE(line.find(" 9600 samples"), std::string::npos) << line;
         const CommandResult wanted =
             RunCommand("ffmpeg -nostdin -v quiet -f " + std::string(kind.source) +
                        " -ar 48000 -ac 2 -i " + Quoted(raw) + " -f s24le -c:a pcm_s24le -");
-        ExpectSame(Delivered(movie), {wanted.out.begin(), wanted.out.end()});
+        for (const unsigned version : {0u, 1u, 2u}) {
+            SCOPED_TRACE("version " + std::to_string(version));
+            movies::SoundFormat format;
+            format.codec = kind.codec;
+            format.version = version;
+            format.bits = kind.bits;
+            format.extensions = {
+                movies::Box("pcmC").Version(0).U8(kind.isLittle ? 1 : 0).U8(kind.bits)};
+            movies::Track track = movies::SoundTrack(format, 9600);
+            track.samples[0].size = kind.bits / 8 * 2;
+            track.data = ReadFile(raw);
+            ASSERT_EQ(track.data.size(), 9600u * kind.bits / 8 * 2);
+            const auto movie = WriteSound(track, "linear.mov");
+            const std::string line = SoundLine(Describe(movie));
+            EXPECT_EQ(line.substr(0, std::string(kind.label).size()), kind.label) << line;
+            EXPECT_NE(line.find(" 9600 samples"), std::string::npos) << line;
+            ExpectSame(Delivered(movie), {wanted.out.begin(), wanted.out.end()});
+        }
     }
 }
 

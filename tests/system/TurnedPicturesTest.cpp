@@ -30,11 +30,11 @@ class TurnedPictures : public SystemTest {
 protected:
     // Six pictures without loss, 48 x 32, turned by the filter.
     std::filesystem::path Make(const std::string& name, const std::string& filter,
-                               const std::string& options = "") {
+                               const std::string& more = "") {
         const std::filesystem::path file = folder() / name;
         EXPECT_EQ(RunCommand("ffmpeg -nostdin -y -v error -f lavfi -i "
                              "testsrc2=s=48x32:r=25:d=0.24,format=rgb24 -vf '" +
-                             filter + "' -c:v png -pix_fmt rgb24 " + options + " " + Quoted(file))
+                             filter + "' -c:v png -pix_fmt rgb24 " + more + " " + Quoted(file))
                       .status,
                   0);
         return file;
@@ -125,40 +125,53 @@ TEST_F(TurnedPictures, OfASheetHaveCellsOfTheirShape) {
     }
 }
 
-// Mirrors, which FFmpeg writes nowhere; and what is no quarter turn.
-TEST_F(TurnedPictures, FollowEachDisplayMatrix) {
+constexpr std::size_t kWidth = 16;
+constexpr std::size_t kHeight = 8;
+
+std::uint8_t Grey(std::size_t x, std::size_t y) {
+    return static_cast<std::uint8_t>(10 * x + 5 * y);
+}
+
+// Two uncompressed pictures whose greys tell where they are; with an alpha of
+// those greys where they have 32 bits.
+movies::Track Greys(const movies::Matrix& matrix, unsigned depth = 24,
+                    std::optional<std::pair<std::uint32_t, std::uint32_t>> pixelAspect = {}) {
     movies::VideoFormat format;
     format.codec = "raw ";
-    format.width = 16;
-    format.height = 8;
-    movies::Track track = movies::VideoTrack(format, 2, 25, 1, 16 * 8 * 3);
-    const auto grey = [](std::size_t x, std::size_t y) {
-        return static_cast<std::uint8_t>(10 * x + 5 * y);
-    };
-    for (std::size_t i = 0; i < 2 * 16 * 8; ++i) {
-        track.data.insert(track.data.end(), 3, grey(i % 16, i / 16 % 8));
+    format.width = kWidth;
+    format.height = kHeight;
+    format.depth = depth;
+    format.pixelAspect = pixelAspect;
+    movies::Track track = movies::VideoTrack(format, 2, 25, 1, kWidth * kHeight * depth / 8);
+    for (std::size_t i = 0; i < 2 * kWidth * kHeight; ++i) {
+        track.data.insert(track.data.end(), depth / 8, Grey(i % kWidth, i / kWidth % kHeight));
     }
+    track.matrix = matrix;
+    return track;
+}
+
+// Mirrors, which FFmpeg writes nowhere; and what is no quarter turn.
+TEST_F(TurnedPictures, FollowEachDisplayMatrix) {
     const struct {
         movies::Matrix matrix;
         std::size_t width;
         std::uint8_t corners[2];  // left and right of the first line
     } kCases[] = {
-        {movies::kIdentity, 16, {grey(0, 0), grey(15, 0)}},
-        {movies::kRotated90, 8, {grey(0, 7), grey(0, 0)}},
-        {movies::kRotated180, 16, {grey(15, 7), grey(0, 7)}},
-        {movies::kRotated270, 8, {grey(15, 0), grey(15, 7)}},
-        {{-1, 0, 0, 0, 1, 0, 16, 0, 1}, 16, {grey(15, 0), grey(0, 0)}},
-        {{1, 0, 0, 0, -1, 0, 0, 8, 1}, 16, {grey(0, 7), grey(15, 7)}},
-        {{0, 1, 0, 1, 0, 0, 0, 0, 1}, 8, {grey(0, 0), grey(0, 7)}},
-        {{0, -1, 0, -1, 0, 0, 8, 16, 1}, 8, {grey(15, 7), grey(15, 0)}},
-        {{0, 2, 0, -2, 0, 0, 0, 0, 1}, 8, {grey(0, 7), grey(0, 0)}},  // shown larger
-        {{0.7, 0.7, 0, -0.7, 0.7, 0, 0, 0, 1}, 16, {grey(0, 0), grey(15, 0)}},
+        {movies::kIdentity, 16, {Grey(0, 0), Grey(15, 0)}},
+        {movies::kRotated90, 8, {Grey(0, 7), Grey(0, 0)}},
+        {movies::kRotated180, 16, {Grey(15, 7), Grey(0, 7)}},
+        {movies::kRotated270, 8, {Grey(15, 0), Grey(15, 7)}},
+        {{-1, 0, 0, 0, 1, 0, 16, 0, 1}, 16, {Grey(15, 0), Grey(0, 0)}},
+        {{1, 0, 0, 0, -1, 0, 0, 8, 1}, 16, {Grey(0, 7), Grey(15, 7)}},
+        {{0, 1, 0, 1, 0, 0, 0, 0, 1}, 8, {Grey(0, 0), Grey(0, 7)}},
+        {{0, -1, 0, -1, 0, 0, 8, 16, 1}, 8, {Grey(15, 7), Grey(15, 0)}},
+        {{0, 2, 0, -2, 0, 0, 0, 0, 1}, 8, {Grey(0, 7), Grey(0, 0)}},  // shown larger
+        {{0.7, 0.7, 0, -0.7, 0.7, 0, 0, 0, 1}, 16, {Grey(0, 0), Grey(15, 0)}},
     };
     for (const auto& one : kCases) {
         SCOPED_TRACE(testing::PrintToString(one.matrix));
         movies::Movie movie;
-        track.matrix = one.matrix;
-        movie.tracks = {track};
+        movie.tracks = {Greys(one.matrix)};
         const EssenceBytes picture = Written("frame", Write(movie));
         ASSERT_EQ(picture.size(), 16u * 8u * 3u);
         EXPECT_EQ(picture[0], one.corners[0]);
@@ -166,6 +179,76 @@ TEST_F(TurnedPictures, FollowEachDisplayMatrix) {
         const std::string size =
             std::to_string(one.width) + " x " + std::to_string(128 / one.width);
         EXPECT_NE(said_.find(size), std::string::npos) << said_;
+    }
+}
+
+// Points go through the track's matrix first.
+TEST_F(TurnedPictures, FollowTheMatrixOfTheMovieBehindThatOfTheTrack) {
+    constexpr movies::Matrix kMirrored = {-1, 0, 0, 0, 1, 0, 16, 0, 1};
+    const struct {
+        movies::Matrix track;
+        movies::Matrix movie;
+        std::size_t width;
+        std::uint8_t corners[2];
+    } kCases[] = {
+        {movies::kIdentity, movies::kRotated90, 8, {Grey(0, 7), Grey(0, 0)}},
+        {movies::kRotated90, movies::kRotated90, 16, {Grey(15, 7), Grey(0, 7)}},
+        {movies::kRotated90, movies::kRotated270, 16, {Grey(0, 0), Grey(15, 0)}},
+        {kMirrored, movies::kRotated90, 8, {Grey(15, 7), Grey(15, 0)}},
+        {movies::kRotated90, kMirrored, 8, {Grey(0, 0), Grey(0, 7)}},
+    };
+    for (const auto& one : kCases) {
+        SCOPED_TRACE(testing::PrintToString(one.movie));
+        movies::Movie movie;
+        movie.matrix = one.movie;
+        movie.tracks = {Greys(one.track)};
+        const EssenceBytes picture = Written("frame", Write(movie));
+        ASSERT_EQ(picture.size(), kWidth * kHeight * 3);
+        EXPECT_EQ(picture[0], one.corners[0]);
+        EXPECT_EQ(picture[(one.width - 1) * 3], one.corners[1]);
+    }
+}
+
+// Neither the sound in front nor the second picture is asked.
+TEST_F(TurnedPictures, FollowTheTrackThatIsShown) {
+    movies::Movie movie;
+    movie.tracks = {movies::SoundTrack(movies::SoundFormat(), 480), Greys(movies::kRotated90),
+                    Greys(movies::kRotated180)};
+    const EssenceBytes picture = Written("frame", Write(movie));
+    ASSERT_EQ(picture.size(), kWidth * kHeight * 3);
+    EXPECT_EQ(picture[0], Grey(0, 7));
+    EXPECT_EQ(picture[7 * 3], Grey(0, 0));
+}
+
+TEST_F(TurnedPictures, TurnTheirAlphaWithThem) {
+    movies::Movie movie;
+    movie.tracks = {Greys(movies::kRotated90, 32)};
+    const auto file = folder() / "alpha.png";
+    ASSERT_EQ(
+        RunCliphost("frame --with-alpha " + Quoted(Write(movie)) + " -o " + Quoted(file)).status,
+        0);
+    const EssenceBytes alpha =
+        Decoded(file, "-frames:v 1 -vf alphaextract -f rawvideo -pix_fmt gray");
+    ASSERT_EQ(alpha.size(), kWidth * kHeight);
+    for (std::size_t y = 0; y < kWidth; ++y) {
+        for (std::size_t x = 0; x < kHeight; ++x) {
+            EXPECT_EQ(alpha[y * kHeight + x], Grey(y, kHeight - 1 - x)) << x << " " << y;
+        }
+    }
+}
+
+// Pixels twice as wide as high make a shape of four to one.
+TEST_F(TurnedPictures, OfASheetKeepTheShapeOfTheirPixels) {
+    const struct {
+        movies::Matrix matrix;
+        std::size_t cellHeight;
+    } kCases[] = {{movies::kIdentity, 16}, {movies::kRotated180, 16}, {movies::kRotated90, 256}};
+    for (const auto& one : kCases) {
+        movies::Movie movie;
+        movie.tracks = {Greys(one.matrix, 24, std::pair<std::uint32_t, std::uint32_t>(2, 1))};
+        const EssenceBytes sheet =
+            Written("contact --frames 2 --columns 2 --width 64", Write(movie));
+        EXPECT_EQ(sheet.size(), (2u * 72u + 8u) * (one.cellHeight + 16u) * 3u) << one.cellHeight;
     }
 }
 

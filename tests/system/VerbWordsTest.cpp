@@ -37,7 +37,7 @@ TEST_F(VerbWords, CountOneChannelAndOneSample) {
     ExpectSays(RunCliphost("audio " + movie + " --count 9" + rate + Out("a.wav")), 0,
                "the sound ends 1 sample behind sample 0");
     ExpectSays(RunCliphost("frame " + movie + " -o " + Out("a.png")), 1,
-               "it has no picture track; its one track is 0 sound\n");
+               "it has no picture track; its one track is 0 (sound)\n");
 }
 
 TEST_F(VerbWords, CountOneFrame) {

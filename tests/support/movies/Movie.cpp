@@ -34,7 +34,7 @@ Box MovieHeader(const Movie& movie) {
     }
     box.Fixed16(1).U16(0x0100).Zeros(10);
     for (std::size_t i = 0; i < 9; ++i) {
-        i % 3 == 2 ? box.Fixed30(kIdentity[i]) : box.Fixed16(kIdentity[i]);
+        i % 3 == 2 ? box.Fixed30(movie.matrix[i]) : box.Fixed16(movie.matrix[i]);
     }
     return box.Zeros(24).U32(movie.nextTrackId);
 }

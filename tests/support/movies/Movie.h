@@ -91,6 +91,7 @@ struct Track {
     std::vector<Box> added;
     std::vector<std::string> omitted;
     std::vector<Box> userData;
+    std::vector<Box> inTrack;  // in trak behind the others, such as tref
 };
 
 enum class Place { kBeforeMedia, kBehindMedia };
@@ -102,6 +103,7 @@ struct Movie {
     std::uint64_t creationTime = 3786825600u;  // 2024-01-01, in seconds from 1904
     std::uint32_t nextTrackId = 0xFFFFFFFF;
     unsigned headerVersion = 0;  // mvhd
+    Matrix matrix = kIdentity;
 
     Place header = Place::kBehindMedia;
     std::string brand = "qt  ";  // empty: no ftyp

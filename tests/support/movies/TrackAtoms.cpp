@@ -318,7 +318,7 @@ Box TrackBox(const Track& track, std::uint32_t id, std::uint32_t movieTimeScale,
     if (!track.userData.empty()) {
         box.Add(Box("udta").Add(track.userData).U32(0));
     }
-    return box;
+    return box.Add(track.inTrack);
 }
 
 }  // namespace movies

@@ -298,6 +298,11 @@ struct RefusedCall {
     const char* statement;
 };
 
+void PrintTo(const RefusedCall& refused, std::ostream* to) {
+    *to << refused.call << (refused.native != 0 ? " native" : "")
+        << (refused.bigEndian ? " big-endian" : "");
+}
+
 class AudioRefusalTest : public AudioDescriptorTest,
                          public ::testing::WithParamInterface<RefusedCall> {};
 

@@ -277,6 +277,10 @@ struct RefusedCall {
     const char* statement;
 };
 
+void PrintTo(const RefusedCall& refused, std::ostream* to) {
+    *to << refused.call;
+}
+
 class DescriptionRefusalTest : public NewAAFFromMovieTest,
                                public ::testing::WithParamInterface<RefusedCall> {};
 

@@ -1,10 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
-
 #include <chrono>
 #include <filesystem>
 #include <fstream>
@@ -105,33 +101,6 @@ TEST_F(SyntheticTimecodeTest, TellsTheErrorOfTheFailedQueryNotOfTheLogsOwnWork) 
     PluginLogSink::Instance().Start(host.factory());
     ASSERT_EQ(Add(), NCF_OK);
     EXPECT_EQ(log.count(std::string(kFunction) + " - FileTimeToSystemTime, hresult: 2"), 1);
-}
-
-// Few file systems bear a date that no calendar of the module holds; memory's
-// own does.
-TEST_F(SyntheticTimecodeTest, ADateThatCannotBeConvertedIsMidnightWithoutALine) {
-    const std::filesystem::path path =
-        "/dev/shm/cliphost-test-date-" + std::to_string(getpid()) + ".mov";
-    std::ofstream(path) << "bytes";
-    constexpr time_t kFarAway = 9000000000000;
-    const struct timespec times[2] = {{kFarAway, 0}, {kFarAway, 0}};
-    struct stat status {};
-    const bool borne = utimensat(AT_FDCWD, path.c_str(), times, 0) == 0 &&
-                       stat(path.c_str(), &status) == 0 && status.st_mtime == kFarAway;
-    NCFSmartPtr<INCFString> name;
-    name.attach(MakeHostString(path.string()));
-    clip->setFileName(name.inArg());
-    const NCFRESULT added = Add();
-    std::filesystem::remove(path);
-    if (!borne) {
-        GTEST_SKIP() << "no file system here bears the date";
-    }
-    ASSERT_EQ(added, NCF_OK);
-    EXPECT_EQ(slots, 2u);
-    EXPECT_TRUE(aaf.has("Timecode2.Initialize 0 {0 drop 1 fps 25}"));
-    EXPECT_EQ(host.console().count(4, "Modification Date is day 0, hour 0, minute 0, second 0\n\n"),
-              1);
-    EXPECT_FALSE(log.contains("FileTimeToSystemTime"));
 }
 
 TEST_F(SyntheticTimecodeTest, AfterOtherSlotsTheMainSlotsFillerEndsTheClip) {

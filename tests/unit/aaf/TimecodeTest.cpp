@@ -103,6 +103,10 @@ struct FailedStep {
     NCFRESULT result;
 };
 
+void PrintTo(const FailedStep& step, std::ostream* to) {
+    *to << step.call;
+}
+
 class TimecodeFailureTest : public TimecodeTest,
                             public ::testing::WithParamInterface<FailedStep> {};
 

@@ -72,37 +72,7 @@ protected:
         Make<IAAFMultipleDescriptor>("MultipleDescriptor");
 };
 
-TEST_F(TracksTest, ChecksItsArgumentsInOrder) {
-    const std::tr1::shared_ptr<BaseClip> none;
-    const auto master = As<IAAFMasterMob>(masterMob);
-    const auto file = As<IAAFSourceMob>(fileMob);
-    const auto source = As<IAAFSourceMob>(sourceMob);
-    INCFComponentFactory* const factory = host.factory();
-    const char* const names[] = {"media.get()",      "pConsole",          "pDictionary",
-                                 "pMobMasterMob",    "pMasterMob",        "pMobFileMob",
-                                 "pFileMob",         "pMobSourceMob",     "pSourceMob",
-                                 "pMultiDescriptor", "pComponentFactory", "absoluteStartTime"};
-    for (int missing = 0; missing < 12; ++missing) {
-        log.clear();
-        // The header is not among what is checked.
-        EXPECT_EQ(
-            AddTracksToAAF(missing == 0 ? none : Media(),
-                           missing == 1 ? NCFSmartPtr<INCFConsole>() : Console(), nullptr,
-                           missing == 2 ? nullptr : (IAAFDictionary*)Dictionary(),
-                           missing == 3 ? nullptr : (IAAFMob*)masterMob,
-                           missing == 4 ? nullptr : (IAAFMasterMob*)master,
-                           missing == 5 ? nullptr : (IAAFMob*)fileMob,
-                           missing == 6 ? nullptr : (IAAFSourceMob*)file,
-                           missing == 7 ? nullptr : (IAAFMob*)sourceMob,
-                           missing == 8 ? nullptr : (IAAFSourceMob*)source,
-                           missing == 9 ? nullptr : (IAAFMultipleDescriptor*)multi,
-                           missing == 10 ? nullptr : factory, missing == 11 ? nullptr : &start),
-            NCF_E_POINTER);
-        EXPECT_EQ(log.count(std::string("CHK_PTR(") + names[missing] + ")" + kFunction), 1);
-    }
-}
-
-// Of several that are missing the first one is told.
+// Each is missing once alone and once with all behind it.
 TEST_F(TracksTest, TellsTheFirstMissingArgumentAlone) {
     const std::tr1::shared_ptr<BaseClip> none;
     const auto master = As<IAAFMasterMob>(masterMob);
@@ -112,23 +82,26 @@ TEST_F(TracksTest, TellsTheFirstMissingArgumentAlone) {
                                  "pMobMasterMob",    "pMasterMob",        "pMobFileMob",
                                  "pFileMob",         "pMobSourceMob",     "pSourceMob",
                                  "pMultiDescriptor", "pComponentFactory", "absoluteStartTime"};
-    for (int present = 0; present < 12; ++present) {
-        log.clear();
-        EXPECT_EQ(AddTracksToAAF(present > 0 ? Media() : none,
-                                 present > 1 ? Console() : NCFSmartPtr<INCFConsole>(), nullptr,
-                                 present > 2 ? (IAAFDictionary*)Dictionary() : nullptr,
-                                 present > 3 ? (IAAFMob*)masterMob : nullptr,
-                                 present > 4 ? (IAAFMasterMob*)master : nullptr,
-                                 present > 5 ? (IAAFMob*)fileMob : nullptr,
-                                 present > 6 ? (IAAFSourceMob*)file : nullptr,
-                                 present > 7 ? (IAAFMob*)sourceMob : nullptr,
-                                 present > 8 ? (IAAFSourceMob*)source : nullptr,
-                                 present > 9 ? (IAAFMultipleDescriptor*)multi : nullptr,
-                                 present > 10 ? host.factory() : nullptr, nullptr),
-                  NCF_E_POINTER);
-        ASSERT_EQ(log.records().size(), 1u) << names[present];
-        EXPECT_EQ(log.records()[0].text,
-                  std::string("CHK_PTR(") + names[present] + ")" + kFunction);
+    for (int missing = 0; missing < 12; ++missing) {
+        for (const bool alone : {true, false}) {
+            const auto has = [&](int i) { return i < missing || (alone && i > missing); };
+            log.clear();
+            // The header is not among what is checked.
+            EXPECT_EQ(
+                AddTracksToAAF(
+                    has(0) ? Media() : none, has(1) ? Console() : NCFSmartPtr<INCFConsole>(),
+                    nullptr, has(2) ? (IAAFDictionary*)Dictionary() : nullptr,
+                    has(3) ? (IAAFMob*)masterMob : nullptr,
+                    has(4) ? (IAAFMasterMob*)master : nullptr, has(5) ? (IAAFMob*)fileMob : nullptr,
+                    has(6) ? (IAAFSourceMob*)file : nullptr, has(7) ? (IAAFMob*)sourceMob : nullptr,
+                    has(8) ? (IAAFSourceMob*)source : nullptr,
+                    has(9) ? (IAAFMultipleDescriptor*)multi : nullptr,
+                    has(10) ? host.factory() : nullptr, has(11) ? &start : nullptr),
+                NCF_E_POINTER);
+            ASSERT_EQ(log.records().size(), 1u) << names[missing];
+            EXPECT_EQ(log.records()[0].text,
+                      std::string("CHK_PTR(") + names[missing] + ")" + kFunction);
+        }
     }
 }
 

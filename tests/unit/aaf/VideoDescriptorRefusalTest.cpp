@@ -20,6 +20,13 @@ struct RefusedCall {
     const char* statement;
 };
 
+void PrintTo(const RefusedCall& refused, std::ostream* to) {
+    *to << refused.call << (*refused.code ? " of " : "") << refused.code
+        << (std::string(refused.statement).find("colorDetails.ref") != std::string::npos
+                ? " with levels"
+                : "");
+}
+
 class VideoRefusalTest : public VideoDescriptorTest,
                          public ::testing::WithParamInterface<RefusedCall> {};
 

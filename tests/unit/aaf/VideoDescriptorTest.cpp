@@ -105,6 +105,11 @@ struct LayoutCase {
     int expectedHeight;
 };
 
+void PrintTo(const LayoutCase& given, std::ostream* to) {
+    *to << given.width << 'x' << given.height << " layout " << given.layout << " result "
+        << static_cast<ncfUInt32>(given.result);
+}
+
 class FrameLayoutTest : public VideoDescriptorTest,
                         public ::testing::WithParamInterface<LayoutCase> {};
 

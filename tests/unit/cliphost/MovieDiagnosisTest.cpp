@@ -43,8 +43,8 @@ TEST(MovieDiagnosis, TellsFilesThatHoldNothing) {
     EXPECT_NE(DiagnoseMovie(folder.path()).reason.find("this is a folder"), std::string::npos);
     // One that nobody writes to would be waited for without end.
     ASSERT_EQ(mkfifo((folder / "pipe.mov").c_str(), 0600), 0);
-    EXPECT_NE(DiagnoseMovie(folder / "pipe.mov").reason.find("a pipe or device"),
-              std::string::npos);
+    EXPECT_EQ(DiagnoseMovie(folder / "pipe.mov").reason, "this is no file but a pipe");
+    EXPECT_EQ(DiagnoseMovie("/dev/null").reason, "this is no file but a device of characters");
     ExpectSays("", "the file is empty");
 }
 
@@ -52,6 +52,13 @@ TEST(MovieDiagnosis, TellsFilesOfAnotherFamily) {
     ExpectSays("RIFF1234WAVE", "no movie of the QuickTime family");
     ExpectSays("abc", "the file holds 3 bytes and no atom");
     ExpectSays(Atom("abcd", ""), "no movie of the QuickTime family");
+}
+
+// To convert what is none helps nobody.
+TEST(MovieDiagnosis, GivesNoAdviceThatCantHelp) {
+    EXPECT_EQ(Diagnosis("RIFF1234WAVE").find("convert"), std::string::npos);
+    EXPECT_EQ(Diagnosis(Atom("ftyp", "", 7)).find("convert"), std::string::npos);
+    EXPECT_EQ(Diagnosis(Atom("ftyp", "", 7)).find("another kind"), std::string::npos);
 }
 
 TEST(MovieDiagnosis, TellsWhereAFileWasCut) {

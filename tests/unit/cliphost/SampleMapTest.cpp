@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include "tests/unit/cliphost/StubSampleMap.h"
+
 using cliphost::MappedSample;
 using cliphost::ReadMappedSample;
 using cliphost::ReadRuns;
@@ -18,7 +20,7 @@ struct Stored {
 
 // A map over a list of samples, which answers as a module does: the size in 32
 // bits, runs as far as bytes follow each other.
-class FakeMap final : public NMA::ISampleMapping {
+class FakeMap final : public cliphost_tests::StubSampleMap {
 public:
     explicit FakeMap(std::vector<Stored> samples) : samples_(std::move(samples)) {}
 
@@ -28,11 +30,6 @@ public:
     NCFRESULT offsetResult = NCF_OK;
     std::size_t sizeQueries = 0;
 
-    NCFRESULT QueryInterface(const GUID&, void**) override { return NCF_E_NOINTERFACE; }
-    ncfUInt32 AddRef() override { return 1; }
-    ncfUInt32 Release() override { return 1; }
-    ncfSInt32 GetNumberOfTracks() override { return 1; }
-    NCFRESULT GetNumberOfChannels(ncfUInt32, ncfUInt32*) override { return NCF_E_NOTIMPL; }
     NCFRESULT GetNumberOfSamples(ncfUInt32 track, ncfUInt64* count) override {
         if (track != 0) {
             return NCF_E_FAIL;
@@ -40,7 +37,6 @@ public:
         *count = samples_.size();
         return NCF_OK;
     }
-    NCFRESULT GetSampleStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return NCF_E_NOTIMPL; }
     NCFRESULT GetSampleSize(ncfUInt32, ncfUInt64 sample, ncfUInt64* size) override {
         ++sizeQueries;
         if (sample >= samples_.size()) {
@@ -67,53 +63,22 @@ public:
         *dependencies = 1;
         return NCF_OK;
     }
-    NCFRESULT GetSampleDependency(ncfUInt32, ncfUInt64, ncfUInt32, ncfSInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetNumberOfEncodedUnits(ncfUInt32, ncfUInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetEncodedUnitStride(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitPosition(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitSize(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitSizeInSamples(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitFirstSample(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetEncodedUnitContainingSample(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
     NCFRESULT GetNumberOfContiguousSamples(ncfUInt32, ncfUInt64, ncfSInt64* count) override {
         *count = -1;
         return NCF_OK;
     }
     NCFRESULT GetNumberOfContiguousBytes(ncfUInt32, ncfUInt64 sample, ncfUInt64* bytes) override {
-        ncfUInt64 sum = 0;
+        const ncfUInt64 begin = samples_.at(sample).position;
+        Stored last{};
         do {
-            sum += samples_.at(sample).size;
+            last = samples_[sample];
             ++sample;
         } while (sample < samples_.size() &&
-                 samples_[sample].position ==
-                     samples_[sample - 1].position + samples_[sample - 1].size);
-        *bytes = sum + wrongBytes;
+                 (samples_[sample].position == last.position ||
+                  samples_[sample].position == last.position + last.size));
+        *bytes = last.position + last.size - begin + wrongBytes;
         return NCF_OK;
     }
-    NCFRESULT GetNumberOfContiguousEncodedUnits(ncfUInt32, ncfUInt64, ncfSInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT RegisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT UnregisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT SetStorageCallback(INCFUnknown*) override { return NCF_E_NOTIMPL; }
 };
 
 const std::vector<Stored> kTwoRuns = {{100, 10}, {110, 20}, {130, 5}, {500, 7}, {507, 1}};
@@ -176,6 +141,48 @@ TEST(SampleMap, IsNotDeceivedBySamplesThatOnlyBeginAndEndAlike) {
     EXPECT_EQ(runs.bytes, 17u);
     ASSERT_EQ(runs.runs.size(), 2u);
     EXPECT_EQ(runs.runs[0].count, 4u);
+    EXPECT_TRUE(runs.faults.empty());
+}
+
+// As of sound that is coded in blocks, counted frame by frame: the last block of a
+// run may hold fewer.
+TEST(SampleMap, CountsAPacketOfSeveralSamplesOnce) {
+    std::vector<Stored> samples;
+    for (ncfUInt32 i = 0; i < 10 * 1017 + 5; ++i) {
+        samples.push_back({36 + ncfUInt64{i / 1017} * 1024, 1024});
+    }
+    FakeMap one(samples);
+    RunMap runs = ReadRuns(one, 0, 36 + 11 * 1024);
+    ASSERT_EQ(runs.runs.size(), 1u);
+    EXPECT_EQ(runs.runs[0].count, samples.size());
+    EXPECT_EQ(runs.runs[0].bytes, 11u * 1024);
+    EXPECT_EQ(runs.bytes, 11u * 1024);
+    EXPECT_TRUE(runs.faults.empty());
+    EXPECT_LT(one.sizeQueries, 40u);
+    // A second run, in packets that hold fewer.
+    const std::size_t behind = samples.size();
+    for (ncfUInt32 i = 0; i < 30; ++i) {
+        samples.push_back({50000 + ncfUInt64{i / 7} * 1024, 1024});
+    }
+    FakeMap two(samples);
+    runs = ReadRuns(two, 0, 60000);
+    ASSERT_EQ(runs.runs.size(), 2u);
+    EXPECT_EQ(runs.runs[0].count, behind);
+    EXPECT_EQ(runs.runs[1].first, behind);
+    EXPECT_EQ(runs.runs[1].count, 30u);
+    EXPECT_EQ(runs.bytes, (11u + 5u) * 1024);
+    EXPECT_TRUE(runs.faults.empty());
+    EXPECT_EQ(ReadRuns(two, 0, 52000).faults.size(), 1u);
+}
+
+TEST(SampleMap, MeasuresARunWhosePacketsHoldDifferentNumbersOfSamples) {
+    FakeMap map({{0, 8}, {0, 8}, {0, 8}, {8, 8}, {16, 8}, {16, 8}, {100, 8}, {100, 8}});
+    const RunMap runs = ReadRuns(map, 0, 200);
+    ASSERT_EQ(runs.runs.size(), 2u);
+    EXPECT_EQ(runs.runs[0].count, 6u);
+    EXPECT_EQ(runs.runs[0].bytes, 24u);
+    EXPECT_EQ(runs.runs[1].count, 2u);
+    EXPECT_EQ(runs.bytes, 32u);
     EXPECT_TRUE(runs.faults.empty());
 }
 

@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/OutputFile.h"
 #include "tests/unit/cliphost/TestFolder.h"
 
+using cliphost::OutputFile;
 using cliphost::UnfinishedFile;
 using namespace cliphost_tests;
 
@@ -40,6 +41,21 @@ TEST(UnfinishedFile, IsRemovedWhenItCantTakeItsPlace) {
     }
     EXPECT_TRUE(std::filesystem::is_directory(folder / "a.aaf"));
     EXPECT_EQ(folder.CountFiles(), 1u);
+}
+
+// The longest name that a file can have leaves no room for an ending.
+TEST(UnfinishedFile, TakesAPlaceOfAnyName) {
+    const TestFolder folder;
+    for (const std::size_t length : {200, 223, 224, 250, 255}) {
+        const std::filesystem::path place = folder / std::string(length, 'n');
+        OutputFile file(place);
+        file.Write("whole", 5);
+        file.Finish();
+        EXPECT_EQ(ContentOf(place), "whole") << length;
+    }
+    EXPECT_EQ(folder.CountFiles(), 5u);
+    EXPECT_EQ(UnfinishedFile(folder / "a.aaf").path().native().find((folder / "a.aaf.").native()),
+              0u);
 }
 
 TEST(UnfinishedFile, IsRemovedWhenASignalEndsTheProgram) {

@@ -130,20 +130,22 @@ TEST_F(QuickTimeClipLoading, ShowsZerosBehindTheEndAlsoInAUsedBuffer) {
     EXPECT_EQ(parser->fed[1].bytes, expected);
 }
 
-TEST_F(QuickTimeClipOfLargeFile, GrowsTheBufferAndKeepsItForSmallerReads) {
+TEST_F(QuickTimeClipOfLargeFile, GrowsTheBufferAndKeepsItForReadsThatItHolds) {
     parser->script = {{QT_E_MOREDATA, 5, 1000000},
+                      {QT_E_MOREDATA, 9, 1000000},
                       {QT_E_MOREDATA, 1000001, 100},
                       {QT_E_MOREDATA, 7, 500000},
                       {NCF_OK, 0, 0}};
     LoadVideo();
     EXPECT_TRUE(clip->IsLoaded());
     const auto whole = CountingBytes(1200000);
-    ASSERT_EQ(parser->fed.size(), 4u);
-    EXPECT_EQ(parser->fed[2].place, parser->fed[1].place) << "a smaller read";
-    EXPECT_EQ(parser->fed[3].place, parser->fed[1].place) << "a larger one that has room still";
+    ASSERT_EQ(parser->fed.size(), 5u);
+    EXPECT_EQ(parser->fed[2].place, parser->fed[1].place) << "one of the same size";
+    EXPECT_EQ(parser->fed[3].place, parser->fed[1].place) << "a smaller read";
+    EXPECT_EQ(parser->fed[4].place, parser->fed[1].place) << "a larger one that has room still";
     EXPECT_EQ(parser->fed[1].bytes,
               std::vector<ncfUInt8>(whole.begin() + 5, whole.begin() + 1000005));
-    EXPECT_EQ(parser->fed[2].bytes,
+    EXPECT_EQ(parser->fed[3].bytes,
               std::vector<ncfUInt8>(whole.begin() + 1000001, whole.begin() + 1000101));
 }
 

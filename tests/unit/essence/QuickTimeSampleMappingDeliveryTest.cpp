@@ -527,7 +527,8 @@ TEST_F(Delivery, MappingsOfOneClipShareItsReaders) {
     lock = ours;
 }
 
-// The reader is the clip's, but a mapping stops it only once it uses it.
+// The reader is the clip's, but a mapping stops it only once it uses it. Then
+// every other mapping needs a Setup.
 TEST_F(Delivery, CleanupOfAMappingWithoutAChoiceLeavesTheOthersReaderAlone) {
     Movie({kBGRAPixelFormat, kb64aPixelFormat});
     Choose(0, 0);
@@ -556,6 +557,8 @@ TEST_F(Delivery, CleanupOfAMappingWithoutAChoiceLeavesTheOthersReaderAlone) {
     EXPECT_EQ(other->Cleanup(0), NCF_OK);
     EXPECT_EQ(journal.count("reader.ReleaseQT"), 2) << "each one goes to the reader";
     Frame().assign(8, 0);
+    EXPECT_EQ(Ask(0), NMA_E_NOTINITIALIZED) << "the reader that both use is stopped";
+    EXPECT_EQ(mapping->Setup(0), NCF_OK);
     journal.clear();
     EXPECT_EQ(Ask(0), NCF_OK) << "the first one's choice stands";
     EXPECT_EQ(journal.startingWith("reader.Set").back(), "reader.SetOutputPixelFormat BGRA 0 0");

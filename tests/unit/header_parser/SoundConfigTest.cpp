@@ -34,10 +34,12 @@ Told Parse(const std::string& codec, const Box& config, bool isWave = false) {
     SoundFormat format;
     format.codec = codec;
     format.extensions = {config};
+    format.rate = codec == "mlpa" ? 48000 / 65536.0 : 48000;  // there a whole number
     format.wave = isWave;
     format.version = isWave ? 1 : 0;
     movies::Movie movie;
     movie.tracks = {movies::SoundTrack(format, 4800)};
+    movie.tracks[0].mediaTimeScale = 48000;
     const ParsedMovie parsed(movie);
     const auto description = parsed.SoundDescription();
     if (!description) {
@@ -139,12 +141,16 @@ TEST(SoundConfig, OfOtherKindsTellsChannelsAndRate) {
     const Bytes vorbis = {2, 30, 40, 1, 'v', 'o',  'r',  'b', 'i', 's',
                           0, 0,  0,  0, 1,   0x44, 0xAC, 0,   0};
     EXPECT_EQ(Parse("mp4a", Esds(0xDD, vorbis)), (Told{1, 44100}));
+    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0x10008001).Zeros(6)), (Told{2, 96000}));
+    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0x80078000).Zeros(6)), (Told{6, 44100}));
+    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0x0007804F).Zeros(6)), (Told{8, 48000}));
     EXPECT_EQ(Parse("samr", Box("damr").Zeros(9)), (Told{1, 8000}));
     EXPECT_EQ(Parse("sawb", Box("damr").Zeros(9)), (Told{1, 16000}));
 }
 
 TEST(SoundConfig, ThatIsMissingLeavesTheFields) {
-    for (const char* const codec : {"mp4a", "Opus", "ac-3", "ec-3", "fLaC", "alac", "QDM2"}) {
+    for (const char* const codec :
+         {"mp4a", "Opus", "ac-3", "ec-3", "fLaC", "alac", "mlpa", "QDM2"}) {
         EXPECT_EQ(Parse(codec, Box("free")), kTemplate) << codec;
     }
     EXPECT_EQ(Parse("mp4a", Esds(0x6B, {})), kTemplate);
@@ -163,13 +169,13 @@ TEST(SoundConfig, CutShortTellsNothingFalse) {
                                 told == Told{1, 44100} || told == Told{2, 44100};
         EXPECT_TRUE(isPossible) << size << ": " << told;
     }
-    for (const char* const name : {"dOps", "dac3", "dec3", "dfLa", "alac"}) {
-        const std::string codec = name == std::string("dOps")   ? "Opus"
-                                  : name == std::string("dac3") ? "ac-3"
-                                  : name == std::string("dec3") ? "ec-3"
-                                  : name == std::string("dfLa") ? "fLaC"
-                                                                : "alac";
-        EXPECT_EQ(Parse(codec, Box(name)).channels, 2u) << name;
+    for (const auto& [codec, config] : {std::pair{"Opus", "dOps"},
+                                        {"ac-3", "dac3"},
+                                        {"ec-3", "dec3"},
+                                        {"fLaC", "dfLa"},
+                                        {"alac", "alac"},
+                                        {"mlpa", "dmlp"}}) {
+        EXPECT_EQ(Parse(codec, Box(config)).channels, 2u) << config;
     }
 }
 
@@ -193,6 +199,7 @@ TEST(SoundConfig, OfImpossibleNumbersLeavesTheFields) {
     alac.Version(0).U32(4096).U8(0).U8(16).U8(40).U8(10).U8(14).U8(0).U16(255).U32(0).U32(0);
     alac.U32(0xFFFFFFFF);
     EXPECT_EQ(Parse("alac", alac), kTemplate);
+    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0xF0078000).Zeros(6)), kTemplate);
 }
 
 TEST(SoundConfig, OfRandomBytesIsTakenOrLeft) {
@@ -200,13 +207,14 @@ TEST(SoundConfig, OfRandomBytesIsTakenOrLeft) {
     SCOPED_TRACE("seed " + std::to_string(seed));
     std::mt19937 random(seed);
     const char* const codecs[][2] = {{"mp4a", "esds"}, {"Opus", "dOps"}, {"ac-3", "dac3"},
-                                     {"ec-3", "dec3"}, {"fLaC", "dfLa"}, {"alac", "alac"}};
+                                     {"ec-3", "dec3"}, {"fLaC", "dfLa"}, {"alac", "alac"},
+                                     {"mlpa", "dmlp"}};
     for (int i = 0; i < 3000; ++i) {
         Bytes bytes(random() % 40);
         for (auto& byte : bytes) {
             byte = static_cast<std::uint8_t>(random());
         }
-        const auto& codec = codecs[random() % 6];
+        const auto& codec = codecs[random() % std::size(codecs)];
         const Box box = random() % 2 && codec[0] == std::string("mp4a") ? Esds(0x40, bytes)
                                                                         : Box(codec[1]).Raw(bytes);
         const Told told = Parse(codec[0], box);

@@ -111,8 +111,11 @@ TEST(Track, OfPlainSoundIsAsLongAsItsHeadersAgree) {
         ncfUInt64 track;  // a tenth of a second is 4800 units of the media
         ncfUInt32 expected;
     } kHeaders[] = {
-        {4800, 60, 4800}, {9600, 120, 9600}, {2400, 30, 2400}, {2401, 30, 4800},
-        {9600, 60, 4800}, {9600, 0, 4800},  // nothing but the media's header says so
+        {4800, 60, 4800},  {2400, 30, 2400}, {2401, 30, 4800},
+        {9600, 60, 4800},  {9600, 0, 4800},  // nothing but the media's header says so
+        {4880, 61, 4880},                    // a unit of the movie
+        {4960, 62, 4800},                    // more than there is
+        {9600, 120, 4800},                   // likewise
     };
     for (const auto& header : kHeaders) {
         Movie movie;
@@ -129,6 +132,21 @@ TEST(Track, OfPlainSoundIsAsLongAsItsHeadersAgree) {
     }
 }
 
+// What the track tells in units of the movie is half a sample of the media off at
+// most: 31 of 600 a second are 2278.5 of 44100.
+TEST(Track, OfPlainSoundAgreesToTheNearestSample) {
+    for (const auto& [media, expected] :
+         {std::pair(2277u, 4410u), {2278u, 2278u}, {2279u, 2279u}, {2280u, 4410u}}) {
+        movies::SoundFormat format;
+        format.rate = 44100;
+        Movie movie;
+        movie.tracks = {movies::SoundTrack(format, 4410)};
+        movie.tracks[0].mediaDuration = media;
+        movie.tracks[0].trackDuration = 31;
+        EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), expected);
+    }
+}
+
 // An edit counts for more than the track's header.
 TEST(Track, OfPlainSoundAgreesWithItsEditsFirst) {
     Movie movie;
@@ -137,8 +155,84 @@ TEST(Track, OfPlainSoundAgreesWithItsEditsFirst) {
     movie.tracks[0].trackDuration = 120;
     movie.tracks[0].edits = {{60, 0, 1.0}};
     EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), 4800u);
-    movie.tracks[0].edits = {{120, 0, 1.0}};
-    EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), 9600u);
+    movie.tracks[0].mediaDuration = 2400;
+    EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), 4800u);
+    movie.tracks[0].edits = {{30, 0, 1.0}};
+    EXPECT_EQ(Ask(ParsedMovie(movie).Sound(), &ITrackInfo::GetMediaDuration), 2400u);
+}
+
+// Whole units of the movie are all that a track can tell, and hosts read plain
+// sound themselves where track and media tell the same.
+TEST(Track, OfPlainSoundEndsWithItsSamplesAtAWholeUnit) {
+    Movie movie;
+    movie.tracks = {movies::SoundTrack(movies::SoundFormat(), 4850)};
+    movie.tracks[0].mediaDuration = 9600;
+    movie.tracks[0].trackDuration = 120;
+    const ParsedMovie parsed(movie);
+    EXPECT_EQ(Ask(parsed.Sound(), &ITrackInfo::GetTrackDuration), 60u);
+    EXPECT_EQ(Ask(parsed.Sound(), &ITrackInfo::GetMediaDuration), 4800u);
+    EXPECT_EQ(Ask(&parsed.Parser(), &IQTParser::GetMovieDuration), 60u);
+}
+
+// Thirty samples, one second: 600 units of the movie, 20 to each sample.
+TEST(Track, LastsNoLongerThanItsMediaCanFill) {
+    using movies::Edit;
+    const struct {
+        const char* name;
+        std::vector<Edit> edits;
+        ncfUInt64 header;
+        ncfUInt32 expected;
+    } kTracks[] = {
+        {"as long", {}, 600, 600},
+        {"a sample and a unit more", {}, 621, 621},
+        {"more", {}, 622, 600},
+        {"much more", {}, 2000, 600},
+        {"less", {}, 300, 300},
+        {"an edit that is longer", {{2000, 0, 1.0}}, 2000, 600},
+        {"an edit of all that there can be", {{0xFFFFFFFF, 0, 1.0}}, 600, 600},
+        {"an edit that begins later", {{600, 15, 1.0}}, 600, 300},
+        {"an open edit that begins later", {{0, 15, 1.0}}, 600, 300},
+        {"two edits, one too long", {{300, 0, 1.0}, {600, 15, 1.0}}, 900, 600},
+        {"all twice", {{600, 0, 1.0}, {600, 0, 1.0}}, 1200, 1200},
+        {"a gap in front", {{900, -1, 1.0}, {600, 0, 1.0}}, 1500, 1500},
+        {"slow", {{1200, 0, 0.5}}, 1200, 1200},
+        {"too long for a fast one", {{600, 0, 2.0}}, 600, 300},
+        {"dwelling", {{2000, 5, 0.0}}, 2000, 2000},
+        {"backwards", {{2000, 5, -1.0}}, 2000, 2000},
+        {"nothing but a gap", {{900, -1, 1.0}}, 900, 900},
+        {"nothing that there is", {{900, 30, 1.0}}, 900, 900},
+    };
+    for (const auto& track : kTracks) {
+        SCOPED_TRACE(track.name);
+        Movie movie = PlainMovie();
+        movie.tracks[0].edits = track.edits;
+        movie.tracks[0].trackDuration = track.header;
+        movie.duration = track.header;
+        const ParsedMovie parsed(movie);
+        EXPECT_EQ(Ask(parsed.Video(), &ITrackInfo::GetTrackDuration), track.expected);
+        EXPECT_EQ(Ask(&parsed.Parser(), &IQTParser::GetMovieDuration), track.expected);
+    }
+}
+
+// Pictures shown late end late, and edits begin where the first is shown.
+TEST(Track, IsFilledUpToTheLastPictureShown) {
+    Movie movie = PlainMovie();
+    movie.tracks[0].samples[0].displayOffset = 15;
+    movie.tracks[0].edits = {{600, 15, 1.0}};
+    EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetTrackDuration), 600u);
+    movie.tracks[0].edits = {{900, 15, 1.0}};
+    EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetTrackDuration), 600u);
+}
+
+// What neither shows nor sounds fills no time, nor do samples without duration.
+TEST(Track, OfAnotherKindLastsAsLongAsItTells) {
+    Movie movie = PlainMovie();
+    movie.tracks[0].trackDuration = 2000;
+    movie.tracks[0].handler = "text";
+    EXPECT_EQ(Ask(ParsedMovie(movie).Other(), &ITrackInfo::GetTrackDuration), 2000u);
+    movie.tracks[0].handler = "vide";
+    movie.tracks[0].samples[0].duration = 0;
+    EXPECT_EQ(Ask(ParsedMovie(movie).Video(), &ITrackInfo::GetTrackDuration), 2000u);
 }
 
 TEST(Track, WhoseSamplesLastLongerThan32BitsTellIsRefused) {

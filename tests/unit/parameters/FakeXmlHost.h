@@ -38,9 +38,9 @@ protected:
     }
 };
 
-// A node of a host document that refuses what it is told to and counts how
-// often its children and its tag are asked for. The test owns the tree; references are
-// counted, not obeyed.
+// A node of a host document that refuses what it is told to and counts how often
+// its children, its tag and its name are asked for. The test owns the tree;
+// references are counted, not obeyed.
 class FakeXmlNode final : public IXmlNode, public Refusals {
 public:
     FakeXmlNode(XmlNodeType type, const std::string& name, const std::string& value = {})
@@ -62,6 +62,7 @@ public:
     int references = 0;
     int childQuestions = 0;
     int tagQuestions = 0;
+    int nameQuestions = 0;
 
     NCFRESULT QueryInterface(const GUID& iid, void** out) override {
         *out = nullptr;
@@ -89,7 +90,10 @@ public:
 
     ncfBool HasAttributes() override { return attributes_.empty() ? 0 : 1; }
     ncfUInt32 GetType() override { return type_; }
-    NCFRESULT GetName(INCFString** out) override { return GiveText("GetName", name_, out); }
+    NCFRESULT GetName(INCFString** out) override {
+        ++nameQuestions;
+        return GiveText("GetName", name_, out);
+    }
     NCFRESULT GetValue(INCFString** out) override { return GiveText("GetValue", value_, out); }
     ncfUInt32 GetChildCount() override {
         ++childQuestions;

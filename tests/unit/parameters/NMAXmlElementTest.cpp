@@ -3,10 +3,13 @@
 
 #include "source/parameters/NMAXmlElement.h"
 
+#include <memory>
+
 #include "tests/unit/parameters/XmlTest.h"
 
 namespace {
 
+using NMA::XMLUtils::NMAXmlAttribute;
 using NMA::XMLUtils::NMAXmlNode;
 using NMA::XMLUtils::NMAXmlPair;
 
@@ -50,8 +53,49 @@ TEST_F(XmlElement, FindsChildrenByIndexesInAnyOrderAndAfterChanges) {
     root->RemoveChild(first);
     delete first;
     EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "3");
-    root->FindChild(S("c"), 0)->SetTagName(S("b"));
+    Element* const other = root->FindChild(S("c"), 0);
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "3");
+    other->SetTagName(S("b"));  // in front of it, one more
     EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "2");
+    other->SetTagName(S("c"));
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "3");
+    root->RemoveChild(other);  // in front of it, one that doesn't match
+    delete other;
+    EXPECT_EQ(TextOf(root->FindChild(S("b"), 2)), "3");
+}
+
+// The document may be gone by then.
+TEST_F(XmlElement, RenamesAnElementThatWasTakenOutOfItsDocument) {
+    auto gone = std::make_unique<Doc>(host.factory());
+    gone->CreateRoot(S("a"));
+    Element* child = nullptr;
+    gone->GetRoot()->AddChildElement(S("b"), &child);
+    gone->GetRoot()->RemoveChild(child);
+    const std::unique_ptr<Element> removed(child);
+    Element copy;
+    removed->CopyTo(copy);
+    gone.reset();
+    removed->SetTagName(S("c"));
+    copy.SetTagName(S("d"));
+    EXPECT_EQ(TagOf(removed.get()), "c");
+    EXPECT_EQ(TagOf(&copy), "d");
+}
+
+// Through the attribute itself; the element learns of it with its next change.
+TEST_F(XmlElement, LearnsWhatBecameOfItsAttributesWithItsNextChange) {
+    Element* const root = load("<a x=\"1\" y=\"2\"/>");
+    NMAXmlAttribute* const first = root->FindAttribute(S("x"));
+    first->MarkDeleted();
+    root->AddText(S("t"));
+    EXPECT_FALSE(root->HasAttribute(S("x")));
+    first->DiscardNewChildren();  // brings it back
+    root->AddText(S("t"));
+    EXPECT_EQ(AttributeOf(root, "x"), "1");
+    NMAXmlAttribute(S("z"), S("3")).CopyTo(*first);
+    root->AddText(S("t"));
+    EXPECT_EQ(AttributeOf(root, "z"), "3");
+    EXPECT_FALSE(root->HasAttribute(S("x")));
+    EXPECT_EQ(AttributeOf(root, "y"), "2");
 }
 
 // Attributes may stand behind other children, which come and go.
@@ -181,8 +225,8 @@ TEST_F(XmlElement, RemovesAnAttributeOnce) {
 
 TEST_F(XmlElement, RemovesAllAttributesOfAName) {
     Element* const root = load("<a x=\"1\" y=\"2\"/>");
-    root->AddChild(new NMA::XMLUtils::NMAXmlAttribute(S("x"), S("3")));
-    root->AddChild(new NMA::XMLUtils::NMAXmlAttribute(S("x"), S("4")));
+    root->AddChild(new NMAXmlAttribute(S("x"), S("3")));
+    root->AddChild(new NMAXmlAttribute(S("x"), S("4")));
     root->RemoveAttribute(S("x"));
     EXPECT_FALSE(root->HasAttribute(S("x")));
     std::vector<NMAXmlNode*> attributes;

@@ -67,6 +67,29 @@ TEST_F(XmlHostRefusals, StepsFromChildToChild) {
     EXPECT_LE(questions, 2 * kCount);
 }
 
+// What is added behind the attributes doesn't bring up their names again.
+TEST_F(XmlHostRefusals, AsksEachAttributeForItsNameOnceHoweverMuchIsAdded) {
+    constexpr int kCount = 50;
+    std::vector<FakeXmlNode*> attributes{&x};
+    for (int i = 1; i < kCount; ++i) {
+        attributes.push_back(&root.AddAttribute("x" + std::to_string(i), "1"));
+    }
+    Element* const element = Load();
+    for (int i = 0; i < kCount; ++i) {
+        const std::string number = std::to_string(i);
+        element->AddChildElement(S("new"), nullptr);
+        element->AddText(S("text"));
+        element->SetAttribute(S(("y" + number).c_str()), S("2"));
+        element->AddChild(new NMAXmlAttribute(S(("z" + number).c_str()), S("3")));
+    }
+    EXPECT_EQ(AttributeOf(element, "x49"), "1");
+    EXPECT_EQ(AttributeOf(element, "y49"), "2");
+    EXPECT_EQ(AttributeOf(element, "z49"), "3");
+    for (const FakeXmlNode* const attribute : attributes) {
+        EXPECT_EQ(attribute->nameQuestions, 1);
+    }
+}
+
 // --- loading ----------------------------------------------------------------------
 
 TEST_F(XmlHostRefusals, EveryRefusedStepOfLoadingIsThrown) {
@@ -156,17 +179,40 @@ TEST_F(XmlHostRefusals, RefusedNamesAndValuesAreThrown) {
 TEST_F(XmlHostRefusals, AChildThatCouldNotBeAddedStaysWithTheCaller) {
     Element* const element = Load();
     element->LoadChildren();
-    x.results["GetName"] = NCF_E_ABORT;  // the index of attributes can't be made anew
+    FakeXmlNode foreign(kXmlAttribute, "foreign", "3");
+    foreign.results["GetName"] = NCF_E_ABORT;  // it can't be indexed
+    const std::unique_ptr<NMAXmlNode> added(NMAXmlNode::Wrap(&foreign));
+    EXPECT_EQ(Thrown([&] { element->AddChild(added.get()); }), NCF_E_ABORT);
+    EXPECT_EQ(added->Parent(), nullptr);
+    EXPECT_EQ(Thrown([&] { element->GetOrAddChildForHostNode(&foreign); }), NCF_E_ABORT);
+    EXPECT_EQ(element->Children().size(), 2u) << "what was there";
+    EXPECT_EQ(foreign.references, 1) << "by the caller's node";
+    foreign.results.clear();
+    element->SetAttribute(S("z"), S("4"));
+    EXPECT_EQ(AttributeOf(element, "z"), "4") << "where the refused one stood";
+    element->AddChild(added.get());
+    EXPECT_EQ(AttributeOf(element, "foreign"), "3");
+    element->RemoveChild(added.get());
+    EXPECT_FALSE(element->HasAttribute(S("foreign")));
+    EXPECT_EQ(AttributeOf(element, "x"), "1");
+}
+
+// A deletion anywhere makes all names be asked for again.
+TEST_F(XmlHostRefusals, NothingIsAddedWhileTheNamesCannotBeAsked) {
+    Element* const element = Load();
+    element->FindChild(S("child"), 0)->MarkDeleted();
+    x.results["GetName"] = NCF_E_ABORT;
     Element added;
     EXPECT_EQ(Thrown([&] { element->AddChild(&added); }), NCF_E_ABORT);
     EXPECT_EQ(added.Parent(), nullptr);
     EXPECT_EQ(Thrown([&] { element->AddChildElement(S("new"), nullptr); }), NCF_E_ABORT);
     EXPECT_EQ(Thrown([&] { element->AddChildElementWithText(S("new"), S("t")); }), NCF_E_ABORT);
     EXPECT_EQ(Thrown([&] { element->AddText(S("new")); }), NCF_E_ABORT);
-    FakeXmlNode foreign(kXmlElement, "foreign");
-    EXPECT_EQ(Thrown([&] { element->GetOrAddChildForHostNode(&foreign); }), NCF_E_ABORT);
     EXPECT_EQ(element->Children().size(), 2u) << "what was there";
-    EXPECT_EQ(foreign.references, 0);
+    x.results.clear();
+    element->SetAttribute(S("z"), S("4"));
+    EXPECT_EQ(AttributeOf(element, "x"), "1");
+    EXPECT_EQ(AttributeOf(element, "z"), "4");
 }
 
 TEST_F(XmlHostRefusals, ARefusedIdentityIsThrown) {

@@ -9,6 +9,7 @@
 #include "host_interfaces/framework/PluginEntry.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/util/NMAString.h"
+#include "host_interfaces/util/NMAUtil.h"
 #include "source/plugin/CNCFUnknown.h"
 #include "source/plugin/CreationFunctions.h"
 #include "source/plugin/PluginFolder.h"
@@ -450,6 +451,19 @@ TEST_F(EntryPoints, StartupGivesTheRefusalOfItsFolderString) {
     host.clearRefusals();
     EXPECT_EQ(NCFStartup(host.unknown()), NCF_OK) << "and it starts again";
     EXPECT_NE(GetPluginFolder(), nullptr);
+}
+
+// The string is made here, but takes no text.
+TEST_F(EntryPoints, StartupGivesTheRefusalOfTheFoldersText) {
+    NMATerminate();
+    const NMAString withoutAHost("text");
+    INCFString* const refusing = withoutAHost.InArg();
+    ASSERT_EQ(refusing->AssignUTF16(kNCFWCHAR, u"", 0), NMA_E_NOTINITIALIZED);
+    host.maker(NCFCompID_NCFString,
+               [&](const GUID& iid, void** out) { return refusing->QueryInterface(iid, out); });
+    EXPECT_EQ(NCFStartup(host.unknown()), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(GetPluginFolder(), nullptr);
+    EXPECT_EQ(NCFShutdown(host.unknown()), NCF_OK);
 }
 
 TEST_F(EntryPoints, ARefusedFolderStringLeavesTheFolderOfAStartBefore) {

@@ -4,8 +4,12 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <iterator>
 #include <numeric>
 
+#include "reference_host/quicktime/MovieFile.h"
+#include "reference_host/quicktime/OpenProblem.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;
@@ -38,6 +42,37 @@ TEST(DecodedSound, IsToldOfEachOfManyTracks) {
         EXPECT_EQ(sound.channels, 1) << stream;
         EXPECT_EQ(sound.rate, 44100) << stream;
         EXPECT_EQ(sound.framesPerPacket, 1152) << stream;
+    }
+}
+
+// The descriptions tell of one channel each, the packets hold two.
+TEST(DecodedSound, OfAllTracksTogetherHasABound) {
+    NEEDS_FFMPEG();
+    for (const int count : {512, 513}) {
+        Bytes bytes = TracksOf(count, "-ac 2 -c:a libmp3lame").Content();
+        constexpr char kCodec[] = {'s', 't', 's', 'd', 0, 0, 0, 0, 0, 0, 0, 1};
+        int patched = 0;
+        for (auto at = bytes.begin();; ++patched) {
+            at = std::search(at, bytes.end(), std::begin(kCodec), std::end(kCodec));
+            if (at == bytes.end()) {
+                break;
+            }
+            at += std::size(kCodec) + 8 + 16;  // to the channels of its description
+            ASSERT_EQ(at[1], 2);
+            at[1] = 1;
+        }
+        ASSERT_EQ(patched, count);
+        const MadeMovie movie(bytes, ".mov");
+        std::string reason;
+        const auto opened = host::MovieFile::Open(movie.Path(), reason);
+        if (count == 512) {
+            ASSERT_TRUE(opened) << reason;
+            EXPECT_EQ(opened->SoundFormOf(1)->channels, 2u);
+        } else {
+            EXPECT_FALSE(opened);
+            EXPECT_EQ(reason, "the sounds of the movie have more than 1024 channels together");
+            EXPECT_EQ(host::OpenProblem(movie.Path()), reason);
+        }
     }
 }
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <chrono>
 
 #include "reference_host/quicktime/MovieAtoms.h"
@@ -34,6 +35,54 @@ TEST(MovieAtoms, TellWhereTheDescriptionChanges) {
     EXPECT_EQ(atoms.tracks[0].descriptionChanges, (std::vector<ncfUInt64>{5, 12}));
 }
 
+movies::Bytes FloatSound(unsigned version) {
+    movies::SoundFormat format;
+    format.codec = "fpcm";
+    format.version = version;
+    format.extensions = {movies::Box("pcmC").Version(0).U8(1).U8(64)};
+    movies::Movie movie;
+    movie.tracks = {movies::SoundTrack(format, 10)};
+    return movies::Build(movie).ToBytes();
+}
+
+host::MovieAtoms::Track TrackOf(const movies::Bytes& bytes) {
+    const host::MovieAtoms atoms = host::ReadMovieAtoms(MadeMovie(bytes, ".mov").Path());
+    EXPECT_EQ(atoms.tracks.size(), 1u);
+    return atoms.tracks.empty() ? host::MovieAtoms::Track() : atoms.tracks[0];
+}
+
+TEST(MovieAtoms, TellTheLinearKindBehindTheFieldsOfEachVersion) {
+    for (const unsigned version : {0u, 1u, 2u}) {
+        const host::MovieAtoms::Track track = TrackOf(FloatSound(version));
+        EXPECT_EQ(track.linearBits, 64u) << version;
+        EXPECT_TRUE(track.isLittleEndian) << version;
+    }
+}
+
+TEST(MovieAtoms, TakeTheFieldsOfVersion1OutOfAListOfTheIsoForm) {
+    constexpr char kList[] = "stsd";
+    movies::Bytes bytes = FloatSound(0);
+    const auto list = std::search(bytes.begin(), bytes.end(), kList, kList + 4);
+    ASSERT_NE(list, bytes.end());
+    list[4] = 1;           // version of the list
+    list[12 + 8 + 9] = 1;  // of its one description
+    EXPECT_EQ(TrackOf(bytes).linearBits, 64u);
+}
+
+TEST(MovieAtoms, PassOverFieldsThatClaimMoreThanTheDescriptionHolds) {
+    constexpr char kList[] = "stsd";
+    for (const int claim : {0, 73, 0xFF}) {
+        movies::Bytes bytes = FloatSound(2);
+        const auto list = std::search(bytes.begin(), bytes.end(), kList, kList + 4);
+        ASSERT_NE(list, bytes.end());
+        const auto size = list + 12 + 36;
+        ASSERT_EQ(size[3], 72);
+        size[0] = claim == 0xFF ? 0xFF : 0;
+        size[3] = static_cast<std::uint8_t>(claim);
+        EXPECT_EQ(TrackOf(bytes).linearBits, claim == 0 ? 64u : 0u) << claim;
+    }
+}
+
 TEST(MovieAtoms, TellEditsOfEitherVersion) {
     for (const unsigned version : {0u, 1u}) {
         movies::Movie movie = TwoDescriptions();
@@ -54,6 +103,30 @@ TEST(MovieAtoms, TellNoChangeWithinOneDescription) {
     movies::Movie movie;
     movie.tracks.push_back(movies::VideoTrack(movies::VideoFormat(), 20, 25, 1, 10));
     EXPECT_TRUE(Read(movie).tracks.at(0).descriptionChanges.empty());
+}
+
+TEST(MovieAtoms, TellWhatSamplesLastInSum) {
+    movies::Movie movie = TwoDescriptions();
+    movie.tracks[0].samples[1].duration = 0xFFFFFFFF;
+    const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+    const auto sum =
+        host::SumDurations(file.Path(), host::ReadMovieAtoms(file.Path()).tracks.at(0));
+    ASSERT_TRUE(sum);
+    EXPECT_EQ(sum->samples, 16u);
+    EXPECT_EQ(sum->units, 5 + 7 * 0xFFFFFFFFull + 4);
+}
+
+TEST(MovieAtoms, SumUpNothingThatIsNotThereOrTooMuch) {
+    movies::Movie movie = TwoDescriptions();
+    EXPECT_FALSE(host::SumDurations("nowhere.mov", Read(movie).tracks.at(0)));
+    movie.tracks[0].omitted = {"stts"};
+    EXPECT_FALSE(host::SumDurations(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path(),
+                                    Read(movie).tracks.at(0)));
+    movie.tracks[0].omitted.clear();
+    movie.tracks[0].replaced = {
+        movies::Box("stts").Version(0).U32(1).U32(0xFFFFFFFF).U32(0xFFFFFFFF)};
+    EXPECT_FALSE(host::SumDurations(MadeMovie(movies::Build(movie).ToBytes(), ".mov").Path(),
+                                    Read(movie).tracks.at(0)));
 }
 
 // A table of chunks that goes back, or names more of them than it has, ends there.

@@ -65,17 +65,4 @@ TEST(SoundCodec, DividesAPacketAsItsPartsAreDecoded) {
     EXPECT_EQ(Drain(*codec), 3);
 }
 
-TEST(SoundCodec, ForgetsTheRestOfAPacketForAJump) {
-    const Telephone telephone;
-    const auto codec = host::SoundCodec::Open(telephone.stream, true);
-    ASSERT_TRUE(codec);
-    codec->Send(Blocks(50).get());
-    const host::FrameOwner frame(av_frame_alloc());
-    ASSERT_GE(codec->Receive(*frame), 0);
-    codec->Flush();
-    EXPECT_EQ(Drain(*codec), 0);
-    codec->Send(Blocks(2).get());
-    EXPECT_EQ(Drain(*codec), 2);
-}
-
 }  // namespace

@@ -60,6 +60,19 @@ TEST(TableClaims, OfSamplesOfOneSizeAreBounded) {
     EXPECT_NE(ClaimWith(Box("stz2").Version(0).U32(8).U32(kMany)), "");
 }
 
+// However small the samples, a file holds no more of them than bytes.
+TEST(TableClaims, OfSamplesMayBeAsManyAsAFileHasBytes) {
+    movies::Movie movie = Film();
+    movie.trailing = {Box("free").Zeros(host::kClaimsAlwaysFine)};
+    movie.tracks[0].replaced = {Box("stsz").Version(0).U32(1).U32(1)};
+    const auto length = static_cast<std::uint32_t>(movies::Build(movie).ToBytes().size());
+    ASSERT_GT(length, host::kClaimsAlwaysFine);
+    movie.tracks[0].replaced = {Box("stsz").Version(0).U32(1).U32(length)};
+    EXPECT_EQ(ClaimOf(movie), "");
+    movie.tracks[0].replaced = {Box("stsz").Version(0).U32(1).U32(length + 1)};
+    EXPECT_NE(ClaimOf(movie), "");
+}
+
 TEST(TableClaims, OfDisplayTimesAreBounded) {
     EXPECT_NE(ClaimWith(Box("ctts").Version(0).U32(2).U32(10).U32(0).U32(kMany).U32(1)), "");
     EXPECT_EQ(ClaimWith(Box("ctts").Version(0).U32(2).U32(10).U32(0).U32(1).U32(1)), "");
@@ -79,6 +92,24 @@ TEST(TableClaims, OfFragmentsAreBounded) {
     movie.trailing = {Box("moof").Add(
         Box("traf").Add(Box("tfhd").Version(0).U32(1)).Add(Box("trun").Version(0).U32(5)))};
     EXPECT_EQ(ClaimOf(movie), "");
+}
+
+TEST(TableClaims, OfFragmentsNameTheTrackThatTheyGoOnWith) {
+    movies::Movie movie = Film();
+    movie.tracks.push_back(movie.tracks[0]);
+    movie.tracks[0].id = 7;
+    movie.tracks[1].id = 3;
+    const auto fragmentOf = [](std::uint32_t track) {
+        return Box("moof").Add(Box("traf")
+                                   .Add(Box("tfhd").Version(0).U32(track))
+                                   .Add(Box("trun").Version(0).U32(kMany)));
+    };
+    movie.trailing = {fragmentOf(7)};
+    EXPECT_EQ(ClaimOf(movie).rfind("track 1: 'trun' counts", 0), 0u) << ClaimOf(movie);
+    movie.trailing = {fragmentOf(3)};
+    EXPECT_EQ(ClaimOf(movie).rfind("track 2: 'trun' counts", 0), 0u) << ClaimOf(movie);
+    movie.trailing = {fragmentOf(5)};
+    EXPECT_EQ(ClaimOf(movie).rfind("'trun' counts", 0), 0u) << ClaimOf(movie);
 }
 
 // Each table alone is fine.

@@ -211,23 +211,118 @@ TEST(FirstPictureTrack, IsThatOfTheLowestNumberWhereTheHeaderIsRefused) {
     EXPECT_EQ(count, 3u);
 }
 
-// As with a header that is read: what samples last counts, give or take one.
-TEST(TrackDescriptions, TellTheRateOfTheSamplesWhateverTheHeaderSays) {
-    for (const std::uint64_t told : {10u, 28u, 30u, 300u}) {
-        movies::Movie movie;
-        movie.tracks = {movies::VideoTrack(movies::VideoFormat(), 30, 30, 1, 100)};
-        movie.tracks[0].mediaDuration = told;
+// Chapters of a sound are pictures as well, whoever names them.
+TEST(FirstPictureTrack, MayBeTheChaptersOfAnother) {
+    for (const std::size_t by : {0u, 1u}) {
+        movies::Movie movie = TwoPictures(1, 2);
+        movie.tracks[by].inTrack = {movies::Box("tref").Add(movies::Box("chap").U32(1))};
         const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
         const Wrapper wrapper = OpenWrapper(file.Path());
         ASSERT_TRUE(wrapper);
-        ncfSInt32 numerator = 0, denominator = 0;
-        ncfUInt64 length = 0, track = 0;
-        ASSERT_EQ(wrapper->DetermineMovieEditRateAndLength(0, 25, 60, &numerator, &denominator,
-                                                           &length, &track, 1, 0),
-                  NCF_OK);
-        EXPECT_EQ(numerator, 30) << told;
-        EXPECT_EQ(denominator, 1) << told;
+        EXPECT_EQ(Kinds(wrapper), "-vv") << by;
+        ncfUInt32 track = 0;
+        ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1);
+        EXPECT_EQ(track, 1u) << by;
     }
+}
+
+// The handler tells the header's readers the kind of a track, its code tells
+// the multimedia library.
+TEST(FirstPictureTrack, HasTheHandlerOfPictures) {
+    for (const char* const handler : {"pict", "text", "meta", "tmcd", "hint", "gnrc", "m1v "}) {
+        movies::Movie movie = TwoPictures(1, 2);
+        movie.tracks[0].handler = handler;
+        movies::VideoFormat format;
+        format.codec = "jpeg";  // 'raw ' would be sound
+        movie.tracks[0].descriptions = {format.ToBox()};
+        const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+        const Wrapper wrapper = OpenWrapper(file.Path());
+        ASSERT_TRUE(wrapper) << handler;
+        ncfUInt32 track = 0;
+        ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1) << handler;
+        EXPECT_EQ(track, 2u) << handler;
+    }
+}
+
+// The parser takes this header, but a picture without a size makes no clip.
+TEST(FirstPictureTrack, IsThatOfTheLowestNumberWhereNoClipIsMadeOfTheHeader) {
+    for (const auto& [first, second] : {std::pair(9u, 3u), std::pair(3u, 9u)}) {
+        movies::Movie movie = TwoPictures(first, second);
+        movies::VideoFormat format;
+        format.codec = "raw ";
+        format.width = 0;
+        format.height = 8;
+        movie.tracks[0].descriptions = {format.ToBox()};
+        const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+        const Wrapper wrapper = OpenWrapper(file.Path());
+        ASSERT_TRUE(wrapper);
+        ncfUInt32 track = 0;
+        ASSERT_EQ(wrapper->GetFirstVideoTrack(&track), 1);
+        EXPECT_EQ(track, 3u);
+    }
+}
+
+// The rate of a movie's first pictures, "0/1" where nothing tells it.
+std::string RateOf(const movies::Movie& movie) {
+    const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
+    const Wrapper wrapper = OpenWrapper(file.Path());
+    ncfSInt32 numerator = 0, denominator = 1;
+    ncfUInt64 length = 0, track = 0;
+    EXPECT_TRUE(wrapper);
+    wrapper->DetermineMovieEditRateAndLength(0, 25, 60, &numerator, &denominator, &length, &track,
+                                             1, 0);
+    return std::to_string(numerator) + "/" + std::to_string(denominator);
+}
+
+movies::Movie OnePictureTrack(const std::vector<movies::SampleRun>& samples) {
+    movies::Movie movie;
+    movie.tracks = {movies::VideoTrack(movies::VideoFormat(), 30, 30, 1, 100)};
+    if (!samples.empty()) {
+        movie.tracks[0].samples = samples;
+    }
+    return movie;
+}
+
+// As with a header that is read: what samples last counts, give or take the mean
+// of one.
+TEST(TrackDescriptions, TellTheRateOfTheSamplesWhateverTheHeaderSays) {
+    const std::vector<movies::SampleRun> even;
+    const std::vector<movies::SampleRun> uneven = {{10, 100, 20}, {4, 100, 50}, {1, 100, 200}};
+    const struct {
+        const std::vector<movies::SampleRun>& samples;
+        std::uint32_t timeScale;
+        std::uint64_t told;  // 0 and all bits: unknown
+        const char* rate;
+    } kMovies[] = {
+        {even, 30, 30, "30/1"},      {even, 30, 10, "30/1"},         {even, 30, 28, "30/1"},
+        {even, 30, 300, "30/1"},     {even, 30, 31, "29/1"},         {even, 30, 29, "31/1"},
+        {even, 30, 0, "30/1"},       {even, 30, 0xFFFFFFFF, "30/1"}, {uneven, 1200, 600, "30/1"},
+        {uneven, 1200, 641, "30/1"}, {uneven, 1200, 640, "28/1"},    {uneven, 1200, 559, "30/1"},
+        {uneven, 1200, 560, "32/1"},
+    };
+    for (const unsigned version : {0u, 1u}) {
+        for (const auto& each : kMovies) {
+            movies::Movie movie = OnePictureTrack(each.samples);
+            movie.tracks[0].headerVersion = version;
+            movie.tracks[0].mediaTimeScale = each.timeScale;
+            movie.tracks[0].mediaDuration = each.told;
+            EXPECT_EQ(RateOf(movie), each.rate) << each.told << " of " << each.timeScale;
+        }
+    }
+}
+
+// The table that tells how long samples last counts them as well.
+TEST(TrackDescriptions, TellTheRateOfATableOfFewerOrMoreSamples) {
+    const auto with = [](const movies::Box& table) {
+        movies::Movie movie = OnePictureTrack({});
+        movie.tracks[0].replaced = {table};
+        return RateOf(movie);
+    };
+    const auto table = [] { return movies::Box("stts").Version(0); };
+    EXPECT_EQ(with(table().U32(1).U32(20).U32(1)), "30/1");
+    EXPECT_EQ(with(table().U32(1).U32(40).U32(1)), "30/1");
+    EXPECT_EQ(with(table().U32(0)), "0/1");
+    EXPECT_EQ(with(table().U32(1).U32(30).U32(0)), "30/1") << "as the header tells";
 }
 
 TEST(TrackDescriptions, TellVendorsOfAnyBytes) {

@@ -168,6 +168,26 @@ TEST_F(AttributeTexts, LabelIsReadInEitherCase) {
     EXPECT_FALSE(StringToGUID(NMAString(""), &id));
 }
 
+TEST_F(AttributeTexts, NumbersOfALabelMayBeginAsScannedNumbersDo) {
+    struct {
+        const char* text;
+        GUID label;
+    } const kLabels[] = {
+        {" \n0E170000-0001-0101-060E-2B340401010C",
+         ncfGuid("0E170000-0001-0101-060E-2B340401010C")},
+        {"0x170000-0001-0101-060E-2B340401010C", ncfGuid("00170000-0001-0101-060E-2B340401010C")},
+        {"+E170000- 1-0X1-060E-2B340401010C", ncfGuid("0E170000-0001-0001-060E-2B340401010C")},
+        {"0E170000--1-0101-060E-2B340401010C", ncfGuid("0E170000-FFFF-0101-060E-2B340401010C")},
+        {"E17-1-101-060E-2B340401010Cxyz", ncfGuid("00000E17-0001-0101-060E-2B340401010C")},
+    };
+    for (const auto& [text, label] : kLabels) {
+        GUID id{};
+        EXPECT_FALSE(StringToGUID(NMAString("0E170000-0001"), &id));
+        EXPECT_TRUE(StringToGUID(NMAString(text), &id)) << text;
+        EXPECT_TRUE(id == label) << text;
+    }
+}
+
 TEST_F(AttributeTexts, MalformedTextFailsToLoad) {
     for (const std::string& text :
          {std::string(), std::string("<Bounds>"), std::string(kColour) + "</Wrapper>",

@@ -16,7 +16,8 @@ inline std::string CodeText(ncfUInt32 fourCC) {
             static_cast<char>(fourCC >> 8), static_cast<char>(fourCC)};
 }
 
-// Picture reader over a frame of given bytes, the same at every place.
+// Picture reader over a frame of given bytes, the same at every place. Like a
+// real one it reads nothing while it isn't started.
 class PictureReader : public FakeObject<QTWrapper::IQTVideoReader>, public FakeCalls {
 public:
     explicit PictureReader(Journal* lines) : FakeCalls("reader", lines) {}
@@ -24,6 +25,7 @@ public:
     std::vector<ncfUInt8> frame;
     ncfUInt32 frameSize = 0;  // when not 0, told in place of the frame's size
     void* destination = nullptr;
+    bool isStarted = false;
 
     NCFRESULT SetOutputPixelFormat(ncfUInt32 fourCC, ncfUInt32 a, ncfUInt32 b) override {
         return enter(("SetOutputPixelFormat " + CodeText(fourCC) + " " + std::to_string(a) + " " +
@@ -36,7 +38,9 @@ public:
                      std::to_string(a + b + c));
         destination = to;
         const auto found = results.find("ReadFrame");
-        const NCFRESULT result = found == results.end() ? NCF_OK : found->second;
+        const NCFRESULT result = found != results.end() ? found->second
+                                 : isStarted            ? NCF_OK
+                                                        : NMA_E_NOTINITIALIZED;
         if (result == NCF_OK && !frame.empty()) {
             std::memcpy(to, frame.data(), frame.size());
         }
@@ -50,10 +54,14 @@ public:
     NCFRESULT InitQT(ncfUInt32 mode) override {
         const NCFRESULT result = enter("InitQT");
         EXPECT_EQ(mode, 0u);
+        isStarted = result >= 0;
         return result;
     }
     NCFRESULT ReservedVideoReaderOperation() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReleaseQT() override { return enter("ReleaseQT"); }
+    NCFRESULT ReleaseQT() override {
+        isStarted = false;
+        return enter("ReleaseQT");
+    }
 };
 
 // Sound reader that fills what it is given with 0x55.
