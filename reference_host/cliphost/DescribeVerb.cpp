@@ -153,6 +153,9 @@ void DescribeRun::Take(const Description& description) {
         if (!saved.empty()) {
             entry["aaf"] = MachinePath(saved);
         }
+        if (description.doubt) {
+            AddProblem(description.doubt, entry);
+        }
         AddRoute(description.movie, entry);
         entry["description"] = nlohmann::ordered_json::parse(ToJson(tree));
         json_.push_back(std::move(entry));

@@ -13,18 +13,6 @@
 namespace NMA::XMLUtils {
 namespace {
 
-// Two references stand for one host node when their identities are equal.
-bool IsSameHostNode(IXmlNode* left, IXmlNode* right) {
-    if (!left || !right) {
-        return false;
-    }
-    NCFSmartPtr<INCFUnknown> leftIdentity;
-    NCFSmartPtr<INCFUnknown> rightIdentity;
-    ThrowIfFailed(ncfQuery(left, leftIdentity));
-    ThrowIfFailed(ncfQuery(right, rightIdentity));
-    return leftIdentity == rightIdentity;
-}
-
 // An empty node of the same class, to be filled by CopyTo.
 std::unique_ptr<NMAXmlNode> MakeAlike(const NMAXmlNode& node) {
     if (dynamic_cast<const NMAXmlElement*>(&node)) {
@@ -62,11 +50,13 @@ void NMAXmlNode::deleteChildren() {
     }
     children_.clear();
     standing_ = 0;
+    hostIndexed_ = 0;
 }
 
 void NMAXmlNode::eraseChildAt(std::size_t index) {
     children_.erase(children_.begin() + static_cast<std::ptrdiff_t>(index));
     standing_ = std::min(standing_, index);
+    hostIndexed_ = 0;
 }
 
 NMAXmlNode* NMAXmlNode::Wrap(IXmlNode* hostNode) {
@@ -160,13 +150,27 @@ void NMAXmlNode::MarkDeleted() {
     setState(kDeleted);
 }
 
-std::size_t NMAXmlNode::findHostChild(IXmlNode* hostNode) const {
-    for (std::size_t i = 0; i < children_.size(); ++i) {
-        if (IsSameHostNode(children_[i]->HostNode(), hostNode)) {
-            return i;
+// Only children that are new to the list are asked who they are, unless any node
+// has changed quietly: building a long list costs one look at each.
+std::size_t NMAXmlNode::findHostChild(IXmlNode* hostNode) {
+    const ncfUInt64 changes = QuietChanges();
+    if (hostIndexed_ == 0 || changes != hostIndexedAtChange_) {
+        hostIndex_.clear();
+        hostIndexed_ = 0;
+        hostIndexedAtChange_ = changes;
+    }
+    NCFSmartPtr<INCFUnknown> identity;
+    for (; hostIndexed_ < children_.size(); ++hostIndexed_) {
+        if (IXmlNode* const host = children_[hostIndexed_]->HostNode()) {
+            identity = nullptr;
+            ThrowIfFailed(ncfQuery(host, identity));
+            hostIndex_.emplace(identity.inArg(), hostIndexed_);
         }
     }
-    return children_.size();
+    identity = nullptr;
+    ThrowIfFailed(ncfQuery(hostNode, identity));
+    const auto found = hostIndex_.find(identity.inArg());
+    return found == hostIndex_.end() ? children_.size() : found->second;
 }
 
 void NMAXmlNode::AddChild(NMAXmlNode* node) {

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <atomic>
+#include <unordered_map>
 #include <vector>
 
 #include "host_interfaces/util/NMAString.h"
@@ -103,7 +104,12 @@ private:
     void deleteChildren();
     void appendWrapped(IXmlNode* hostChild);
     void eraseChildAt(std::size_t index);
-    std::size_t findHostChild(IXmlNode* hostNode) const;
+    std::size_t findHostChild(IXmlNode* hostNode);
+
+    // First places of the first children by the identity of their host nodes.
+    std::unordered_map<INCFUnknown*, std::size_t> hostIndex_;
+    std::size_t hostIndexed_ = 0;
+    ncfUInt64 hostIndexedAtChange_ = 0;  // QuietChanges() when it was made
 
     inline static std::atomic<ncfUInt64> quietChanges_{0};
 };

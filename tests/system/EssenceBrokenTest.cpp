@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <fstream>
+#include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/SampleMap.h"
 #include "reference_host/cliphost/SoundReader.h"
@@ -83,10 +84,18 @@ TEST_F(EssenceBroken, PicturesOfAFalseSizeAreNamedByEveryVerb) {
             const bool isWritten = verb == "frame" || verb == "contact";
             const CommandResult ran = RunCliphost(verb + (isDescribed ? " --quiet " : " ") +
                                                   Quoted(movie) + (isWritten ? output : ""));
-            ExpectSays(ran, isDescribed ? 0 : 1, "its description is damaged: copy the file again");
+            ExpectSays(ran, isDescribed ? 0 : 1,
+                       "its description is damaged: copy the file again from where it came");
             EXPECT_EQ(ran.out.rfind(reason, 0), 0u) << ran.out;
         }
         EXPECT_FALSE(std::filesystem::exists(folder() / "a.png"));
+        const auto described =
+            nlohmann::json::parse(RunCommand(Quoted(ProgramFolder() / "cliphost") +
+                                             " describe --json " + Quoted(movie) + " 2>/dev/null")
+                                      .out)[0];
+        EXPECT_TRUE(described.contains("description"));
+        EXPECT_EQ(described["hint"],
+                  "its description is damaged: copy the file again from where it came");
         const CommandResult sound =
             RunCliphost("audio " + Quoted(movie) + " -o " + Quoted(folder() / "a.wav"));
         EXPECT_EQ(sound.status, 0) << sound.out;

@@ -39,7 +39,7 @@ protected:
 };
 
 // A node of a host document that refuses what it is told to and counts how often
-// its children, its tag and its name are asked for. The test owns the tree;
+// its identity, its children, its tag and its name are asked for. The test owns the tree;
 // references are counted, not obeyed.
 class FakeXmlNode final : public IXmlNode, public Refusals {
 public:
@@ -60,6 +60,7 @@ public:
     }
 
     int references = 0;
+    int identityQuestions = 0;
     int childQuestions = 0;
     int tagQuestions = 0;
     int nameQuestions = 0;
@@ -67,6 +68,7 @@ public:
     NCFRESULT QueryInterface(const GUID& iid, void** out) override {
         *out = nullptr;
         if (iid == IID_INCFUnknown || iid == kIID_XmlNode) {
+            identityQuestions += iid == IID_INCFUnknown ? 1 : 0;
             const NCFRESULT result =
                 ResultOf(iid == kIID_XmlNode ? "query node" : "query identity");
             if (result < 0) {
