@@ -28,22 +28,23 @@ struct Span {
     const T& operator[](std::size_t index) const { return first[index]; }
 };
 
+// In the order of the ids of their definitions' classes.
 enum class TypeKind {
     Integer,
-    Character,
     StrongReference,
     WeakReference,
-    Rename,
     Enumeration,
     FixedArray,
     VariableArray,
     Set,
-    Record,
-    Stream,
     String,
+    Stream,
+    Record,
+    Rename,
     ExtendibleEnumeration,
     Indirect,
     Opaque,
+    Character,
 };
 
 struct BuiltInProperty {

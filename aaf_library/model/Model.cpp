@@ -7,7 +7,7 @@
 #include "aaf_library/model/ClassDefinition.h"
 #include "aaf_library/model/Dictionary.h"
 #include "aaf_library/model/Text.h"
-#include "aaf_library/model/TypeFactory.h"
+#include "aaf_library/model/TypeFacts.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 
 namespace aaf {
@@ -15,29 +15,6 @@ namespace aaf {
 namespace {
 
 // Classes of the meta model that a caller may make, by the kind of type.
-struct MetaClass {
-    const GUID& classId;
-    TypeKind kind;
-};
-
-const MetaClass kTypeClasses[] = {
-    {AUID_AAFTypeDefInt, TypeKind::Integer},
-    {AUID_AAFTypeDefStrongObjRef, TypeKind::StrongReference},
-    {AUID_AAFTypeDefWeakObjRef, TypeKind::WeakReference},
-    {AUID_AAFTypeDefEnum, TypeKind::Enumeration},
-    {AUID_AAFTypeDefFixedArray, TypeKind::FixedArray},
-    {AUID_AAFTypeDefVariableArray, TypeKind::VariableArray},
-    {AUID_AAFTypeDefSet, TypeKind::Set},
-    {AUID_AAFTypeDefString, TypeKind::String},
-    {AUID_AAFTypeDefStream, TypeKind::Stream},
-    {AUID_AAFTypeDefRecord, TypeKind::Record},
-    {AUID_AAFTypeDefRename, TypeKind::Rename},
-    {AUID_AAFTypeDefExtEnum, TypeKind::ExtendibleEnumeration},
-    {AUID_AAFTypeDefIndirect, TypeKind::Indirect},
-    {AUID_AAFTypeDefOpaque, TypeKind::Opaque},
-    {AUID_AAFTypeDefCharacter, TypeKind::Character},
-};
-
 // A file has exactly one of each, which comes with it.
 const GUID* const kMadeWithTheFile[] = {&AUID_AAFHeader, &AUID_AAFDictionary,
                                         &AUID_AAFContentStorage};
@@ -174,12 +151,8 @@ HRESULT Model::CreateMetaInstance(const GUID& classId, const GUID& iid, IUnknown
         made->JoinModel(*this);
         return made->QueryInterface(iid, reinterpret_cast<void**>(out));
     }
-    for (const MetaClass& entry : kTypeClasses) {
-        if (classId == entry.classId) {
-            const RefPtr<TypeDefinition> made = MakeType(entry.kind);
-            made->JoinModel(*this);
-            return made->QueryInterface(iid, reinterpret_cast<void**>(out));
-        }
+    if (TypeKind kind{}; IsClassOfTypes(classId, &kind)) {
+        return MakeType(*this, kind)->QueryInterface(iid, reinterpret_cast<void**>(out));
     }
     const bool meta = definition->IsKindOf(AUID_AAFMetaDefinition);
     return meta && !definition->concrete() ? AAFRESULT_ABSTRACT_CLASS : AAFRESULT_INVALID_CLASS_ID;

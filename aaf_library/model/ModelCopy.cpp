@@ -5,16 +5,10 @@
 #include "aaf_library/model/Model.h"
 #include "aaf_library/model/StoredNumbers.h"
 #include "aaf_library/model/TypeEnumeration.h"
-#include "aaf_library/model/TypeExtendibleEnumeration.h"
-#include "aaf_library/model/TypeFixedArray.h"
+#include "aaf_library/model/TypeFacts.h"
 #include "aaf_library/model/TypeIndirect.h"
-#include "aaf_library/model/TypeInteger.h"
 #include "aaf_library/model/TypeRecord.h"
 #include "aaf_library/model/TypeReference.h"
-#include "aaf_library/model/TypeRename.h"
-#include "aaf_library/model/TypeSet.h"
-#include "aaf_library/model/TypeString.h"
-#include "aaf_library/model/TypeVariableArray.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 
 // Copies objects from model to model. Everything is found again by id: numbers
@@ -37,71 +31,22 @@ TypeDefinition* Model::TypeLike(const TypeDefinition& source) {
     if (TypeDefinition* known = FindType(source.id())) {
         return known;
     }
-    RefPtr<TypeDefinition> made = MakeType(source.kind());
-    made->JoinModel(*this);
-    const GUID& id = source.id();
-    const std::wstring& name = source.name();
-    TypeDefinition* element = source.element() == nullptr ? nullptr : TypeLike(*source.element());
-    switch (source.kind()) {
-        case TypeKind::Integer: {
-            const auto& from = static_cast<const TypeInteger&>(source);
-            static_cast<TypeInteger&>(*made).Setup(
-                id, name, static_cast<unsigned>(from.StoredSize()), from.IsSignedType());
-            break;
+    const TypeFacts facts = FactsOf(source);
+    if (source.element() != nullptr) {
+        TypeLike(*source.element());
+    }
+    if (source.kind() == TypeKind::Record) {
+        for (const TypeRecord::Member& member : static_cast<const TypeRecord&>(source).members()) {
+            TypeLike(*member.type);
         }
-        case TypeKind::StrongReference:
-            static_cast<TypeStrongReference&>(*made).Setup(
-                id, name, static_cast<const TypeReference&>(source).targetClass());
-            break;
-        case TypeKind::WeakReference: {
-            const auto& from = static_cast<const TypeWeakReference&>(source);
-            static_cast<TypeWeakReference&>(*made).Setup(id, name, from.targetClass(),
-                                                         from.targetSet());
-            break;
-        }
-        case TypeKind::Enumeration: {
-            const auto& from = static_cast<const TypeEnumeration&>(source);
-            auto& to = static_cast<TypeEnumeration&>(*made);
-            to.Setup(id, name, *element, from.members());
-            to.RegisterSize(static_cast<aafUInt32>(from.NativeSize()));
-            break;
-        }
-        case TypeKind::ExtendibleEnumeration:
-            static_cast<TypeExtendibleEnumeration&>(*made).Setup(
-                id, name, static_cast<const TypeExtendibleEnumeration&>(source).members());
-            break;
-        case TypeKind::Record: {
-            const auto& from = static_cast<const TypeRecord&>(source);
-            std::vector<TypeRecord::Member> members;
-            for (const TypeRecord::Member& member : from.members()) {
-                members.push_back({member.name, TypeLike(*member.type)});
-            }
-            static_cast<TypeRecord&>(*made).Setup(id, name, std::move(members));
-            static_cast<TypeRecord&>(*made).UseLayoutOf(from);
-            break;
-        }
-        case TypeKind::FixedArray:
-            static_cast<TypeFixedArray&>(*made).Setup(
-                id, name, *element, static_cast<const TypeFixedArray&>(source).count());
-            break;
-        case TypeKind::VariableArray:
-            static_cast<TypeVariableArray&>(*made).Setup(id, name, *element);
-            break;
-        case TypeKind::Set:
-            static_cast<TypeSet&>(*made).Setup(id, name, *element);
-            break;
-        case TypeKind::Rename:
-            static_cast<TypeRename&>(*made).Setup(id, name, *element);
-            break;
-        case TypeKind::String:
-            static_cast<TypeString&>(*made).Setup(id, name, *element);
-            break;
-        case TypeKind::Character:
-        case TypeKind::Stream:
-        case TypeKind::Indirect:
-        case TypeKind::Opaque:
-            made->SetIdentity(id, name);
-            break;
+    }
+    RefPtr<TypeDefinition> made = MakeType(*this, facts);
+    // The layout that callers registered is no part of the definition.
+    if (source.kind() == TypeKind::Record) {
+        static_cast<TypeRecord&>(*made).UseLayoutOf(static_cast<const TypeRecord&>(source));
+    } else if (source.kind() == TypeKind::Enumeration) {
+        static_cast<TypeEnumeration&>(*made).RegisterSize(
+            static_cast<aafUInt32>(source.NativeSize()));
     }
     return &Enter(std::move(made));
 }

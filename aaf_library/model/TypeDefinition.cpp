@@ -3,21 +3,10 @@
 #include "aaf_library/model/TypeDefinition.h"
 
 #include "aaf_library/model/Model.h"
+#include "aaf_library/model/TypeFacts.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 
 namespace aaf {
-
-namespace {
-
-// In the order of TypeKind.
-constexpr eAAFTypeCategory_t kCategories[] = {
-    kAAFTypeCatInt,     kAAFTypeCatCharacter, kAAFTypeCatStrongObjRef, kAAFTypeCatWeakObjRef,
-    kAAFTypeCatRename,  kAAFTypeCatEnum,      kAAFTypeCatFixedArray,   kAAFTypeCatVariableArray,
-    kAAFTypeCatSet,     kAAFTypeCatRecord,    kAAFTypeCatStream,       kAAFTypeCatString,
-    kAAFTypeCatExtEnum, kAAFTypeCatIndirect,  kAAFTypeCatOpaque,
-};
-
-}  // namespace
 
 const TypeDefinition& TypeDefinition::Resolved() const {
     const TypeDefinition* at = this;
@@ -69,7 +58,7 @@ HRESULT TypeDefinition::GetTypeCategory(eAAFTypeCategory_t* tid) {
     if (tid == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    *tid = kCategories[static_cast<std::size_t>(kind_)];
+    *tid = CategoryOf(kind_);
     return AAFRESULT_SUCCESS;
 }
 

@@ -23,6 +23,14 @@ enum class ValueForm {
     WeakSet,
 };
 
+// A named part of a type.
+struct TypeMember {
+    std::wstring name;
+    GUID id{};  // record: type of the member; extendible enumeration: value; weak reference:
+                // property on the path from the root to the set of targets
+    aafInt64 value = 0;  // enumeration: value
+};
+
 // A type of values. It knows two layouts of each value: the native one of the C
 // structures and wide characters that callers pass, and the stored one, packed
 // and little-endian, that property values keep.
@@ -72,8 +80,5 @@ private:
 
 // The type behind an argument, when it is of this model; else null.
 TypeDefinition* TypeOf(IAAFTypeDef* argument, const Model* model);
-
-// An empty type definition of that kind.
-RefPtr<TypeDefinition> MakeType(TypeKind kind);
 
 }  // namespace aaf

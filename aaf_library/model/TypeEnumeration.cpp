@@ -56,7 +56,7 @@ HRESULT TypeEnumeration::Initialize(aafUID_constref id, IAAFTypeDef* type, aafIn
         if (elementNames[i] == nullptr) {
             return AAFRESULT_NULL_PARAM;
         }
-        members.push_back({elementNames[i], elementValues[i]});
+        members.push_back({elementNames[i], {}, elementValues[i]});
     }
     return Setup(id, typeName, *element, std::move(members));
 }

@@ -11,10 +11,7 @@ namespace aaf {
 // stored values have the size of the element type.
 class TypeEnumeration : public Implements<TypeDefinition, IAAFTypeDefEnum> {
 public:
-    struct Member {
-        std::wstring name;
-        aafInt64 value;
-    };
+    using Member = TypeMember;
 
     TypeEnumeration() : Implements(TypeKind::Enumeration) {}
 

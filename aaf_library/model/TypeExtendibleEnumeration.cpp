@@ -34,7 +34,7 @@ HRESULT TypeExtendibleEnumeration::Initialize(aafUID_constref id, aafCharacter_c
 const TypeExtendibleEnumeration::Member* TypeExtendibleEnumeration::FindMember(
     const GUID& value) const {
     for (const Member& member : members_) {
-        if (member.value == value) {
+        if (member.id == value) {
             return &member;
         }
     }
@@ -49,7 +49,7 @@ HRESULT TypeExtendibleEnumeration::CreateValueFromName(aafCharacter_constptr nam
     for (const Member& member : members_) {
         if (member.name == name) {
             Bytes stored;
-            AppendGuid(member.value, stored);
+            AppendGuid(member.id, stored);
             return GiveValue(*this, std::move(stored), propVal);
         }
     }
@@ -71,7 +71,7 @@ HRESULT TypeExtendibleEnumeration::GetElementValue(aafUInt32 index, aafUID_t* ou
     if (index >= members_.size()) {
         return AAFRESULT_ILLEGAL_VALUE;
     }
-    *outValue = members_[index].value;
+    *outValue = members_[index].id;
     return AAFRESULT_SUCCESS;
 }
 
@@ -164,7 +164,7 @@ HRESULT TypeExtendibleEnumeration::AppendElement(aafUID_constref value,
     if (FindMember(value) != nullptr) {
         return AAFRESULT_INVALID_PARAM;
     }
-    members_.push_back({name, value});
+    members_.push_back({name, value, 0});
     return AAFRESULT_SUCCESS;
 }
 

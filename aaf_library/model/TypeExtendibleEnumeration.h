@@ -10,10 +10,7 @@ namespace aaf {
 // Named ids; more may be added to one that a caller made.
 class TypeExtendibleEnumeration : public Implements<TypeDefinition, IAAFTypeDefExtEnum> {
 public:
-    struct Member {
-        std::wstring name;
-        GUID value;
-    };
+    using Member = TypeMember;
 
     TypeExtendibleEnumeration() : Implements(TypeKind::ExtendibleEnumeration) {}
 

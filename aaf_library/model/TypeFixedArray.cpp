@@ -51,112 +51,12 @@ HRESULT TypeFixedArray::Initialize(aafUID_constref id, IAAFTypeDef* typeDef, aaf
     return Setup(id, typeName, *elementType, nElements);
 }
 
-HRESULT TypeFixedArray::GetType(IAAFTypeDef** typeDef) {
-    if (typeDef == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    return element() == nullptr ? AAFRESULT_NOT_INITIALIZED : GiveOut(element(), typeDef);
-}
-
 HRESULT TypeFixedArray::GetCount(aafUInt32* count) {
     if (count == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
     *count = static_cast<aafUInt32>(count_);
     return IsInitialized() ? AAFRESULT_SUCCESS : AAFRESULT_NOT_INITIALIZED;
-}
-
-HRESULT TypeFixedArray::CreateValueFromValues(IAAFPropertyValue** elementValues,
-                                              aafUInt32 numElements, IAAFPropertyValue** propVal) {
-    if (elementValues == nullptr || propVal == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    if (!IsInitialized()) {
-        return AAFRESULT_NOT_INITIALIZED;
-    }
-    if (numElements != count_) {
-        return AAFRESULT_ILLEGAL_VALUE;
-    }
-    RefPtr<PropertyValue> value = NewValue();
-    value->BytesToChange().clear();
-    const HRESULT result = FillFromValues(*value, elementValues, numElements);
-    return result < 0 ? result : GiveOut(value.get(), propVal);
-}
-
-HRESULT TypeFixedArray::CreateValueFromCArray(aafMemPtr_t initData, aafUInt32 initDataSize,
-                                              IAAFPropertyValue** propVal) {
-    if (initData == nullptr || propVal == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    if (!IsInitialized()) {
-        return AAFRESULT_NOT_INITIALIZED;
-    }
-    Bytes stored;
-    const HRESULT result = Encode(initData, initDataSize, stored);
-    return result < 0 ? result : GiveValue(*this, std::move(stored), propVal);
-}
-
-HRESULT TypeFixedArray::GetElementValue(IAAFPropertyValue* inPropVal, aafUInt32 index,
-                                        IAAFPropertyValue** outPropVal) {
-    PropertyValue* value = nullptr;
-    if (outPropVal == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    const HRESULT result = Take(inPropVal, &value);
-    return result < 0 ? result : GiveElement(*value, index, outPropVal);
-}
-
-HRESULT TypeFixedArray::GetCArray(IAAFPropertyValue* propVal, aafMemPtr_t data,
-                                  aafUInt32 dataSize) {
-    PropertyValue* value = nullptr;
-    if (data == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    if (const HRESULT result = Take(propVal, &value); result < 0) {
-        return result;
-    }
-    return Decode(value->bytes().data(), value->bytes().size(), data, dataSize);
-}
-
-HRESULT TypeFixedArray::SetElementValue(IAAFPropertyValue* propVal, aafUInt32 index,
-                                        IAAFPropertyValue* memberPropVal) {
-    PropertyValue* value = nullptr;
-    PropertyValue* element = nullptr;
-    if (propVal == nullptr || memberPropVal == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    HRESULT result = Take(propVal, &value);
-    if (result >= 0) {
-        result = TakeElement(memberPropVal, &element);
-    }
-    return result < 0 ? result : ReplaceElement(*value, index, *element);
-}
-
-HRESULT TypeFixedArray::SetCArray(IAAFPropertyValue* propVal, aafMemPtr_t data,
-                                  aafUInt32 dataSize) {
-    PropertyValue* value = nullptr;
-    if (data == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    if (const HRESULT result = Take(propVal, &value); result < 0) {
-        return result;
-    }
-    Bytes stored;
-    const HRESULT result = Encode(data, dataSize, stored);
-    if (result >= 0) {
-        value->BytesToChange() = std::move(stored);
-    }
-    return result;
-}
-
-HRESULT TypeFixedArray::GetElements(IAAFPropertyValue* setPropVal,
-                                    IEnumAAFPropertyValues** enumerator) {
-    PropertyValue* value = nullptr;
-    if (enumerator == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    const HRESULT result = Take(setPropVal, &value);
-    return result < 0 ? result : GiveElements(*value, enumerator);
 }
 
 }  // namespace aaf

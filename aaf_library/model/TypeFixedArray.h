@@ -2,15 +2,14 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "aaf_library/model/TypeOfElements.h"
-#include "not_implemented/AAFTypeDefinitionsOfMany.h"
+#include "aaf_library/model/TypeArray.h"
 
 namespace aaf {
 
 // A fixed number of plain elements.
-class TypeFixedArray : public Implements<TypeOfElements, IAAFTypeDefFixedArray> {
+class TypeFixedArray : public TypeArray<IAAFTypeDefFixedArray> {
 public:
-    TypeFixedArray() : Implements(TypeKind::FixedArray) {}
+    TypeFixedArray() : TypeArray(TypeKind::FixedArray) {}
 
     HRESULT Setup(const GUID& id, const std::wstring& name, TypeDefinition& element,
                   std::size_t count);
@@ -25,20 +24,10 @@ public:
     // -- IAAFTypeDefFixedArray
     HRESULT Initialize(aafUID_constref id, IAAFTypeDef* typeDef, aafUInt32 nElements,
                        aafCharacter_constptr typeName) override;
-    HRESULT GetType(IAAFTypeDef** typeDef) override;
     HRESULT GetCount(aafUInt32* count) override;
-    HRESULT CreateValueFromValues(IAAFPropertyValue** elementValues, aafUInt32 numElements,
-                                  IAAFPropertyValue** propVal) override;
-    HRESULT CreateValueFromCArray(aafMemPtr_t initData, aafUInt32 initDataSize,
-                                  IAAFPropertyValue** propVal) override;
-    HRESULT GetElementValue(IAAFPropertyValue* inPropVal, aafUInt32 index,
-                            IAAFPropertyValue** outPropVal) override;
-    HRESULT GetCArray(IAAFPropertyValue* propVal, aafMemPtr_t data, aafUInt32 dataSize) override;
-    HRESULT SetElementValue(IAAFPropertyValue* propVal, aafUInt32 index,
-                            IAAFPropertyValue* memberPropVal) override;
-    HRESULT SetCArray(IAAFPropertyValue* propVal, aafMemPtr_t data, aafUInt32 dataSize) override;
-    HRESULT GetElements(IAAFPropertyValue* setPropVal,
-                        IEnumAAFPropertyValues** enumerator) override;
+
+protected:
+    bool MayHold(std::size_t elements) const override { return elements == count_; }
 
 private:
     std::size_t count_ = 0;

@@ -198,4 +198,107 @@ HRESULT TypeOfElements::FillFromValues(PropertyValue& value, IAAFPropertyValue**
     return AAFRESULT_SUCCESS;
 }
 
+HRESULT TypeOfElements::TakeBoth(IAAFPropertyValue* list, IAAFPropertyValue* member,
+                                 PropertyValue** value, PropertyValue** element) const {
+    if (list == nullptr || member == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = Take(list, value);
+    return result < 0 ? result : TakeElement(member, element);
+}
+
+HRESULT TypeOfElements::GiveElementType(IAAFTypeDef** typeDef) const {
+    if (typeDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    return element_ == nullptr ? AAFRESULT_NOT_INITIALIZED : GiveOut(element_, typeDef);
+}
+
+HRESULT TypeOfElements::ElementsOf(IAAFPropertyValue* list, IEnumAAFPropertyValues** enumerator) {
+    PropertyValue* value = nullptr;
+    if (enumerator == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = Take(list, &value);
+    return result < 0 ? result : GiveElements(*value, enumerator);
+}
+
+HRESULT TypeOfElements::ElementOf(IAAFPropertyValue* list, aafUInt32 index,
+                                  IAAFPropertyValue** out) const {
+    PropertyValue* value = nullptr;
+    if (out == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = Take(list, &value);
+    return result < 0 ? result : GiveElement(*value, index, out);
+}
+
+HRESULT TypeOfElements::SetElement(IAAFPropertyValue* list, aafUInt32 index,
+                                   IAAFPropertyValue* member) {
+    PropertyValue* value = nullptr;
+    PropertyValue* element = nullptr;
+    const HRESULT result = TakeBoth(list, member, &value, &element);
+    return result < 0 ? result : ReplaceElement(*value, index, *element);
+}
+
+HRESULT TypeOfElements::ValueFromValues(IAAFPropertyValue** elements, aafUInt32 count,
+                                        IAAFPropertyValue** out) {
+    if (elements == nullptr || out == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (!IsInitialized()) {
+        return AAFRESULT_NOT_INITIALIZED;
+    }
+    if (!MayHold(count)) {
+        return AAFRESULT_ILLEGAL_VALUE;
+    }
+    RefPtr<PropertyValue> value = NewValue();
+    value->BytesToChange().clear();
+    const HRESULT result = FillFromValues(*value, elements, count);
+    return result < 0 ? result : GiveOut(value.get(), out);
+}
+
+HRESULT TypeOfElements::ValueFromArray(aafMemPtr_t data, aafUInt32 bytes, IAAFPropertyValue** out) {
+    if (data == nullptr || out == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (!IsInitialized()) {
+        return AAFRESULT_NOT_INITIALIZED;
+    }
+    if (form() != ValueForm::Data) {
+        return AAFRESULT_BAD_TYPE;
+    }
+    Bytes stored;
+    const HRESULT result = Encode(data, bytes, stored);
+    return result < 0 ? result : GiveValue(*this, std::move(stored), out);
+}
+
+HRESULT TypeOfElements::TakePlain(IAAFPropertyValue* list, const void* data,
+                                  PropertyValue** value) const {
+    if (data == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result = Take(list, value);
+    return result >= 0 && form() != ValueForm::Data ? AAFRESULT_BAD_TYPE : result;
+}
+
+HRESULT TypeOfElements::ArrayOf(IAAFPropertyValue* list, aafMemPtr_t data, aafUInt32 bytes) const {
+    PropertyValue* value = nullptr;
+    const HRESULT result = TakePlain(list, data, &value);
+    return result < 0 ? result : Decode(value->bytes().data(), value->bytes().size(), data, bytes);
+}
+
+HRESULT TypeOfElements::SetArray(IAAFPropertyValue* list, aafMemPtr_t data, aafUInt32 bytes) {
+    PropertyValue* value = nullptr;
+    HRESULT result = TakePlain(list, data, &value);
+    Bytes stored;
+    if (result >= 0) {
+        result = Encode(data, bytes, stored);
+    }
+    if (result >= 0) {
+        value->BytesToChange() = std::move(stored);
+    }
+    return result;
+}
+
 }  // namespace aaf

@@ -38,7 +38,26 @@ protected:
     HRESULT EraseElement(PropertyValue& value, std::size_t index);
     HRESULT FillFromValues(PropertyValue& value, IAAFPropertyValue** elements, aafUInt32 count);
 
+    // Both arguments of an operation that puts one element into a list.
+    HRESULT TakeBoth(IAAFPropertyValue* list, IAAFPropertyValue* member, PropertyValue** value,
+                     PropertyValue** element) const;
+
+    // Operations that arrays answer alike, and two of them sets too.
+    HRESULT GiveElementType(IAAFTypeDef** typeDef) const;
+    HRESULT ElementsOf(IAAFPropertyValue* list, IEnumAAFPropertyValues** enumerator);
+    HRESULT ElementOf(IAAFPropertyValue* list, aafUInt32 index, IAAFPropertyValue** out) const;
+    HRESULT SetElement(IAAFPropertyValue* list, aafUInt32 index, IAAFPropertyValue* member);
+    HRESULT ValueFromValues(IAAFPropertyValue** elements, aafUInt32 count, IAAFPropertyValue** out);
+    HRESULT ValueFromArray(aafMemPtr_t data, aafUInt32 bytes, IAAFPropertyValue** out);
+    HRESULT ArrayOf(IAAFPropertyValue* list, aafMemPtr_t data, aafUInt32 bytes) const;
+    HRESULT SetArray(IAAFPropertyValue* list, aafMemPtr_t data, aafUInt32 bytes);
+    // Whether a value may have so many elements.
+    virtual bool MayHold(std::size_t) const { return true; }
+
 private:
+    // The value behind a list of plain data, for a caller's buffer.
+    HRESULT TakePlain(IAAFPropertyValue* list, const void* data, PropertyValue** value) const;
+
     TypeDefinition* element_ = nullptr;
 };
 

@@ -34,15 +34,6 @@ std::size_t TypeSet::Find(const PropertyValue& value, const Bytes& key) const {
     return index;
 }
 
-HRESULT TypeSet::TakeBoth(IAAFPropertyValue* set, IAAFPropertyValue* member, PropertyValue** value,
-                          PropertyValue** element) const {
-    if (set == nullptr || member == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    const HRESULT result = Take(set, value);
-    return result < 0 ? result : TakeElement(member, element);
-}
-
 HRESULT TypeSet::TakeKey(IAAFPropertyValue* set, IAAFPropertyValue* key, PropertyValue** value,
                          Bytes* keyBytes) const {
     if (set == nullptr || key == nullptr) {
@@ -64,13 +55,6 @@ HRESULT TypeSet::Initialize(aafUID_constref id, IAAFTypeDef* typeDef,
     TypeDefinition* elementType = nullptr;
     const HRESULT result = CheckElement(typeDef, typeName, &elementType);
     return result < 0 ? result : SetupElement(id, typeName, *elementType);
-}
-
-HRESULT TypeSet::GetElementType(IAAFTypeDef** typeDef) {
-    if (typeDef == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    return element() == nullptr ? AAFRESULT_NOT_INITIALIZED : GiveOut(element(), typeDef);
 }
 
 HRESULT TypeSet::AddElement(IAAFPropertyValue* setPropertyValue,
@@ -173,16 +157,6 @@ HRESULT TypeSet::ContainsKey(IAAFPropertyValue* setPropertyValue, IAAFPropertyVa
         *containsKey = Find(*value, keyBytes) < CountOf(*value) ? kAAFTrue : kAAFFalse;
     }
     return result;
-}
-
-HRESULT TypeSet::GetElements(IAAFPropertyValue* setPropertyValue,
-                             IEnumAAFPropertyValues** enumerator) {
-    PropertyValue* value = nullptr;
-    if (enumerator == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    const HRESULT result = Take(setPropertyValue, &value);
-    return result < 0 ? result : GiveElements(*value, enumerator);
 }
 
 }  // namespace aaf

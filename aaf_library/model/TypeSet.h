@@ -20,7 +20,7 @@ public:
     // -- IAAFTypeDefSet
     HRESULT Initialize(aafUID_constref id, IAAFTypeDef* typeDef,
                        aafCharacter_constptr typeName) override;
-    HRESULT GetElementType(IAAFTypeDef** typeDef) override;
+    HRESULT GetElementType(IAAFTypeDef** typeDef) override { return GiveElementType(typeDef); }
     HRESULT AddElement(IAAFPropertyValue* setPropertyValue,
                        IAAFPropertyValue* elementPropertyValue) override;
     HRESULT RemoveElement(IAAFPropertyValue* setPropertyValue,
@@ -35,15 +35,15 @@ public:
     HRESULT ContainsKey(IAAFPropertyValue* setPropertyValue, IAAFPropertyValue* key,
                         aafBoolean_t* containsKey) override;
     HRESULT GetElements(IAAFPropertyValue* setPropertyValue,
-                        IEnumAAFPropertyValues** enumerator) override;
+                        IEnumAAFPropertyValues** enumerator) override {
+        return ElementsOf(setPropertyValue, enumerator);
+    }
 
 private:
     // What an element is told apart by.
     Bytes KeyAt(const PropertyValue& value, std::size_t index) const;
     Bytes KeyOf(const PropertyValue& element) const;
     std::size_t Find(const PropertyValue& value, const Bytes& key) const;
-    HRESULT TakeBoth(IAAFPropertyValue* set, IAAFPropertyValue* member, PropertyValue** value,
-                     PropertyValue** element) const;
     HRESULT TakeKey(IAAFPropertyValue* set, IAAFPropertyValue* key, PropertyValue** value,
                     Bytes* keyBytes) const;
 };

@@ -9,6 +9,7 @@
 #include "aaf_library/stored/ModelNames.h"
 #include "aaf_library/stored/ModelTypes.h"
 #include "aaf_library/stored/StoredError.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
 
 #include <algorithm>
 
@@ -26,13 +27,13 @@ bool isExtended(const ClassDefinition& definition) {
 MetaClass recordOf(const ClassDefinition& definition) {
     MetaClass record;
     record.id = definition.id();
-    record.name = utf16Of(definition.name());
+    record.name = definition.name();
     record.parent = definition.parent() == nullptr ? record.id : definition.parent()->id();
     record.concrete = definition.concrete();
     for (const RefPtr<PropertyDefinition>& property : definition.properties()) {
         MetaProperty entry;
         entry.id = property->id();
-        entry.name = utf16Of(property->name());
+        entry.name = property->name();
         entry.pid = property->pid();
         entry.type = property->typeId();
         entry.optional = property->IsOptional();
@@ -55,11 +56,11 @@ void MetaClosure::addType(const GUID& id) {
 }
 
 void MetaClosure::addMetaClasses() {
-    for (const GUID& id : {classDefinitionClass, propertyDefinitionClass, metaDictionaryClass}) {
+    for (const GUID& id : {AUID_AAFClassDef, AUID_AAFPropertyDef, AUID_AAFMetaDictionary}) {
         addClass(id);
     }
-    for (const TypeKindClass& kind : allKindClasses()) {
-        addClass(typeDefinitionClass(kind.kind));
+    for (int kind = 0; kind < kTypeKinds; ++kind) {
+        addClass(ClassOfTypes(static_cast<TypeKind>(kind)));
     }
 }
 
@@ -117,15 +118,15 @@ void MetaClosure::enterType(const GUID& id) {
     if (type == nullptr) {
         throw StoredError("a type that is needed has no definition");
     }
-    records_.types.push_back(stored::recordOf(*type));
-    const MetaType& record = records_.types.back();
-    if (refersToClass(record.kind)) {
+    records_.types.push_back(FactsOf(*type));
+    const TypeFacts& record = records_.types.back();
+    if (RefersToClass(record.kind)) {
         pendingClasses_.push_back(record.target);
-    } else if (kindClass(record.kind).targetPid != 0) {
+    } else if (targetPidOf(record.kind) != 0) {
         pendingTypes_.push_back(record.target);
     }
     if (record.kind == TypeKind::Record) {
-        for (const MetaMember& member : record.members) {
+        for (const TypeMember& member : record.members) {
             pendingTypes_.push_back(member.id);
         }
     }

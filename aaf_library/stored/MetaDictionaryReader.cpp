@@ -2,7 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/MetaKinds.h"
+#include "aaf_library/stored/ModelNames.h"
 #include "aaf_library/stored/StoredNames.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
 
 namespace aaf::stored {
 
@@ -39,8 +41,8 @@ bool flag(const StoredObject& object, std::uint16_t pid, bool absent) {
     return property == nullptr ? absent : property->bytes.front() != 0;
 }
 
-std::u16string nameOf(const StoredObject& object) {
-    return ByteReader(requiredData(object, meta::name)).text();
+std::wstring nameOf(const StoredObject& object) {
+    return wideOf(ByteReader(requiredData(object, meta::name)).text());
 }
 
 GUID requiredTarget(const StoredObject& object, std::uint16_t pid) {
@@ -52,8 +54,8 @@ GUID requiredTarget(const StoredObject& object, std::uint16_t pid) {
 }
 
 // Names one after the other, each with its terminator. Absent: none.
-std::vector<std::u16string> names(const StoredObject& object, std::uint16_t pid) {
-    std::vector<std::u16string> out;
+std::vector<std::wstring> names(const StoredObject& object, std::uint16_t pid) {
+    std::vector<std::wstring> out;
     const StoredProperty* property = find(object, pid, StoredForm::Data);
     if (property == nullptr) {
         return out;
@@ -66,7 +68,7 @@ std::vector<std::u16string> names(const StoredObject& object, std::uint16_t pid)
             name += unit;
             continue;
         }
-        out.push_back(std::move(name));
+        out.push_back(wideOf(name));
         name.clear();
     }
     if (!name.empty()) {
@@ -88,29 +90,29 @@ std::vector<GUID> ids(const StoredObject& object, std::uint16_t pid) {
     return out;
 }
 
-std::vector<MetaMember> named(std::vector<std::u16string> memberNames, std::size_t values) {
+std::vector<TypeMember> named(std::vector<std::wstring> memberNames, std::size_t values) {
     if (memberNames.size() != values) {
         throw StoredError(std::to_string(memberNames.size()) + " names for " +
                           std::to_string(values) + " members");
     }
-    std::vector<MetaMember> members(values);
+    std::vector<TypeMember> members(values);
     for (std::size_t i = 0; i < values; ++i) {
         members[i].name = std::move(memberNames[i]);
     }
     return members;
 }
 
-std::vector<MetaMember> withIds(std::vector<std::u16string> memberNames,
+std::vector<TypeMember> withIds(std::vector<std::wstring> memberNames,
                                 const std::vector<GUID>& values) {
-    std::vector<MetaMember> members = named(std::move(memberNames), values.size());
+    std::vector<TypeMember> members = named(std::move(memberNames), values.size());
     for (std::size_t i = 0; i < values.size(); ++i) {
         members[i].id = values[i];
     }
     return members;
 }
 
-std::vector<MetaMember> enumerationMembers(const StoredObject& object) {
-    std::vector<std::u16string> memberNames = names(object, meta::enumerationNames);
+std::vector<TypeMember> enumerationMembers(const StoredObject& object) {
+    std::vector<std::wstring> memberNames = names(object, meta::enumerationNames);
     std::vector<std::int64_t> values;
     if (const StoredProperty* stored = find(object, meta::enumerationValues, StoredForm::Data)) {
         ByteReader from(stored->bytes);
@@ -118,14 +120,14 @@ std::vector<MetaMember> enumerationMembers(const StoredObject& object) {
             values.push_back(from.number<std::int64_t>());
         }
     }
-    std::vector<MetaMember> members = named(std::move(memberNames), values.size());
+    std::vector<TypeMember> members = named(std::move(memberNames), values.size());
     for (std::size_t i = 0; i < values.size(); ++i) {
         members[i].value = values[i];
     }
     return members;
 }
 
-std::vector<MetaMember> recordMembers(const StoredObject& object) {
+std::vector<TypeMember> recordMembers(const StoredObject& object) {
     std::vector<GUID> types;
     if (const StoredProperty* stored =
             find(object, meta::recordMemberTypes, StoredForm::WeakVector)) {
@@ -136,7 +138,7 @@ std::vector<MetaMember> recordMembers(const StoredObject& object) {
     return withIds(names(object, meta::recordMemberNames), types);
 }
 
-void readMembers(const StoredObject& object, MetaType& record) {
+void readMembers(const StoredObject& object, TypeFacts& record) {
     switch (record.kind) {
         case TypeKind::Integer:
             record.size = requiredNumber<std::uint8_t>(object, meta::integerSize);
@@ -144,7 +146,7 @@ void readMembers(const StoredObject& object, MetaType& record) {
             break;
         case TypeKind::WeakReference: {
             const std::vector<GUID> path = ids(object, meta::weakTargetSet);
-            record.members = withIds(std::vector<std::u16string>(path.size()), path);
+            record.members = withIds(std::vector<std::wstring>(path.size()), path);
             break;
         }
         case TypeKind::Enumeration:
@@ -190,13 +192,13 @@ MetaClass readClass(const StoredObject& object) {
     return record;
 }
 
-MetaType readType(const StoredObject& object, const TypeKindClass& kind) {
-    MetaType record;
+TypeFacts readType(const StoredObject& object, TypeKind kind) {
+    TypeFacts record;
     record.id = guidOf(requiredData(object, meta::identification));
     record.name = nameOf(object);
-    record.kind = kind.kind;
-    if (kind.targetPid != 0) {
-        record.target = requiredTarget(object, kind.targetPid);
+    record.kind = kind;
+    if (const std::uint16_t pid = targetPidOf(kind); pid != 0) {
+        record.target = requiredTarget(object, pid);
     }
     readMembers(object, record);
     return record;
@@ -209,14 +211,14 @@ MetaRecords readMetaDictionary(const StoredObject& metaDictionary) {
     try {
         for (const StoredObject& object :
              requiredSet(metaDictionary, meta::classDefinitions).objects) {
-            if (guidOf(object.classId) == classDefinitionClass) {
+            if (guidOf(object.classId) == AUID_AAFClassDef) {
                 records.classes.push_back(readClass(object));
             }
         }
         for (const StoredObject& object :
              requiredSet(metaDictionary, meta::typeDefinitions).objects) {
-            if (const TypeKindClass* kind = findKindClass(guidOf(object.classId))) {
-                records.types.push_back(readType(object, *kind));
+            if (TypeKind kind{}; IsClassOfTypes(guidOf(object.classId), &kind)) {
+                records.types.push_back(readType(object, kind));
             }
         }
     } catch (const StoredError& problem) {

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/MetaKinds.h"
+#include "aaf_library/stored/ModelNames.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
 
 namespace aaf::stored {
 
@@ -17,10 +19,10 @@ Bytes idBytes(const GUID& id) {
 
 class Definition {
 public:
-    Definition(const GUID& definitionClass, const GUID& id, const std::u16string& name) {
+    Definition(const GUID& definitionClass, const GUID& id, const std::wstring& name) {
         object_.classId = storedAuid(definitionClass);
         data(meta::identification, idBytes(id));
-        data(meta::name, ByteWriter().text(name).bytes());
+        data(meta::name, ByteWriter().text(utf16Of(name)).bytes());
     }
 
     void data(std::uint16_t pid, Bytes value) {
@@ -73,7 +75,7 @@ void addTo(StoredProperty& set, const GUID& id, StoredObject definition) {
 }
 
 StoredObject storedProperty(const MetaProperty& record) {
-    Definition definition(propertyDefinitionClass, record.id, record.name);
+    Definition definition(AUID_AAFPropertyDef, record.id, record.name);
     definition.data(meta::propertyType, idBytes(record.type));  // an id, no weak reference
     definition.flag(meta::isOptional, record.optional);
     definition.number(meta::localIdentification, record.pid);
@@ -84,7 +86,7 @@ StoredObject storedProperty(const MetaProperty& record) {
 }
 
 StoredObject storedClass(const MetaClass& record) {
-    Definition definition(classDefinitionClass, record.id, record.name);
+    Definition definition(AUID_AAFClassDef, record.id, record.name);
     definition.weak(meta::parentClass, record.parent, classPath);
     if (!record.properties.empty()) {
         StoredProperty properties = definitionSet(meta::properties, u"Properties");
@@ -97,33 +99,33 @@ StoredObject storedClass(const MetaClass& record) {
     return definition.take();
 }
 
-Bytes memberNames(const MetaType& record) {
+Bytes memberNames(const TypeFacts& record) {
     ByteWriter names;
-    for (const MetaMember& member : record.members) {
-        names.text(member.name);
+    for (const TypeMember& member : record.members) {
+        names.text(utf16Of(member.name));
     }
     return names.bytes();
 }
 
-Bytes memberIds(const MetaType& record) {
+Bytes memberIds(const TypeFacts& record) {
     ByteWriter ids;
-    for (const MetaMember& member : record.members) {
+    for (const TypeMember& member : record.members) {
         ids.append(storedAuid(member.id));
     }
     return ids.bytes();
 }
 
-Bytes memberValues(const MetaType& record) {
+Bytes memberValues(const TypeFacts& record) {
     ByteWriter values;
-    for (const MetaMember& member : record.members) {
+    for (const TypeMember& member : record.members) {
         values.number(member.value);
     }
     return values.bytes();
 }
 
-void addRecordMembers(Definition& definition, const MetaType& record) {
+void addRecordMembers(Definition& definition, const TypeFacts& record) {
     std::vector<Bytes> types;
-    for (const MetaMember& member : record.members) {
+    for (const TypeMember& member : record.members) {
         types.push_back(idBytes(member.id));
     }
     definition.weak(meta::recordMemberTypes, StoredForm::WeakVector, u"MemberTypes",
@@ -131,10 +133,10 @@ void addRecordMembers(Definition& definition, const MetaType& record) {
     definition.data(meta::recordMemberNames, memberNames(record));
 }
 
-StoredObject storedType(const MetaType& record) {
-    Definition definition(typeDefinitionClass(record.kind), record.id, record.name);
-    if (const std::uint16_t pid = kindClass(record.kind).targetPid; pid != 0) {
-        definition.weak(pid, record.target, refersToClass(record.kind) ? classPath : typePath);
+StoredObject storedType(const TypeFacts& record) {
+    Definition definition(ClassOfTypes(record.kind), record.id, record.name);
+    if (const std::uint16_t pid = targetPidOf(record.kind); pid != 0) {
+        definition.weak(pid, record.target, RefersToClass(record.kind) ? classPath : typePath);
     }
     switch (record.kind) {
         case TypeKind::Integer:
@@ -172,11 +174,11 @@ StoredObject storedMetaDictionary(const MetaRecords& records) {
         addTo(classes, record.id, storedClass(record));
     }
     StoredProperty types = definitionSet(meta::typeDefinitions, u"TypeDefinitions");
-    for (const MetaType& record : records.types) {
+    for (const TypeFacts& record : records.types) {
         addTo(types, record.id, storedType(record));
     }
     StoredObject dictionary;
-    dictionary.classId = storedAuid(metaDictionaryClass);
+    dictionary.classId = storedAuid(AUID_AAFMetaDictionary);
     dictionary.properties.push_back(std::move(classes));
     dictionary.properties.push_back(std::move(types));
     return dictionary;

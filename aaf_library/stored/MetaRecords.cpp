@@ -9,59 +9,27 @@
 
 namespace aaf::stored {
 
-namespace {
-
-// Classes of the meta model differ in one group of their ids.
-GUID metaClass(std::uint16_t number) {
-    GUID id = ncfGuid("0D010101-0000-0000-060E-2B3402060101");
-    id.Data2 = number;
-    return id;
-}
-
-constexpr TypeKindClass typeKinds[] = {
-    {TypeKind::Integer, 0x0204, 0},
-    {TypeKind::StrongReference, 0x0205, meta::strongReferencedType},
-    {TypeKind::WeakReference, 0x0206, meta::weakReferencedType},
-    {TypeKind::Enumeration, 0x0207, meta::enumerationElementType},
-    {TypeKind::FixedArray, 0x0208, meta::fixedArrayElementType},
-    {TypeKind::VariableArray, 0x0209, meta::variableArrayElementType},
-    {TypeKind::Set, 0x020A, meta::setElementType},
-    {TypeKind::String, 0x020B, meta::stringElementType},
-    {TypeKind::Stream, 0x020C, 0},
-    {TypeKind::Record, 0x020D, 0},
-    {TypeKind::Rename, 0x020E, meta::renamedType},
-    {TypeKind::ExtendibleEnumeration, 0x0220, 0},
-    {TypeKind::Indirect, 0x0221, 0},
-    {TypeKind::Opaque, 0x0222, 0},
-    {TypeKind::Character, 0x0223, 0},
-};
-
-}  // namespace
-
-const GUID classDefinitionClass = metaClass(0x0201);
-const GUID propertyDefinitionClass = metaClass(0x0202);
-const GUID metaDictionaryClass = metaClass(0x0225);
-
-Span<TypeKindClass> allKindClasses() {
-    return typeKinds;
-}
-
-const TypeKindClass& kindClass(TypeKind kind) {
-    return *std::find_if(std::begin(typeKinds), std::end(typeKinds),
-                         [&](const TypeKindClass& entry) { return entry.kind == kind; });
-}
-
-const TypeKindClass* findKindClass(const GUID& definitionClass) {
-    for (const TypeKindClass& entry : typeKinds) {
-        if (metaClass(entry.classNumber) == definitionClass) {
-            return &entry;
-        }
+std::uint16_t targetPidOf(TypeKind kind) {
+    switch (kind) {
+        case TypeKind::StrongReference:
+            return meta::strongReferencedType;
+        case TypeKind::WeakReference:
+            return meta::weakReferencedType;
+        case TypeKind::Enumeration:
+            return meta::enumerationElementType;
+        case TypeKind::FixedArray:
+            return meta::fixedArrayElementType;
+        case TypeKind::VariableArray:
+            return meta::variableArrayElementType;
+        case TypeKind::Set:
+            return meta::setElementType;
+        case TypeKind::String:
+            return meta::stringElementType;
+        case TypeKind::Rename:
+            return meta::renamedType;
+        default:
+            return 0;
     }
-    return nullptr;
-}
-
-GUID typeDefinitionClass(TypeKind kind) {
-    return metaClass(kindClass(kind).classNumber);
 }
 
 StoredAuid storedAuid(const GUID& id) {

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "aaf_library/model/BuiltIn.h"
+#include "aaf_library/model/TypeFacts.h"
 #include "aaf_library/stored/StoredTree.h"
 #include "host_interfaces/framework/Guid.h"
 
@@ -17,7 +17,7 @@ namespace aaf::stored {
 
 struct MetaProperty {
     GUID id{};
-    std::u16string name;
+    std::wstring name;
     std::uint16_t pid = 0;
     GUID type{};
     bool optional = false;
@@ -26,32 +26,15 @@ struct MetaProperty {
 
 struct MetaClass {
     GUID id{};
-    std::u16string name;
+    std::wstring name;
     GUID parent{};  // its own id for a root class
     bool concrete = false;
     std::vector<MetaProperty> properties;
 };
 
-struct MetaMember {
-    std::u16string name;
-    GUID id{};  // record: type of the member; extendible enumeration: value; weak reference:
-                // property on the path from the root to the set of targets
-    std::int64_t value = 0;  // enumeration: value
-};
-
-struct MetaType {
-    GUID id{};
-    std::u16string name;
-    TypeKind kind = TypeKind::Integer;
-    GUID target{};           // element, renamed or character type; class referred to
-    std::uint32_t size = 0;  // integer: bytes; fixed array: elements
-    bool isSigned = false;   // integer
-    std::vector<MetaMember> members;
-};
-
 struct MetaRecords {
     std::vector<MetaClass> classes;
-    std::vector<MetaType> types;
+    std::vector<TypeFacts> types;
 };
 
 // The object that the root holds as its MetaDictionary.
@@ -63,8 +46,5 @@ MetaRecords readMetaDictionary(const StoredObject& metaDictionary);
 StoredAuid storedAuid(const GUID& id);
 GUID guidOf(const StoredAuid& id);
 GUID guidOf(const Bytes& bytes);  // throws StoredError unless there are 16
-
-// Class of the definitions of one kind of type.
-GUID typeDefinitionClass(TypeKind kind);
 
 }  // namespace aaf::stored

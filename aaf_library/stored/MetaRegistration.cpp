@@ -40,13 +40,13 @@ MetaRegistration::MetaRegistration(const MetaRecords& records, Model& model) : m
             pids_[record.id].emplace(property.pid, property.id);
         }
     }
-    for (const MetaType& record : records.types) {
+    for (const TypeFacts& record : records.types) {
         types_.emplace(record.id, &record);
     }
     for (const MetaClass& record : records.classes) {
         enterClass(record.id, 0);
     }
-    for (const MetaType& record : records.types) {
+    for (const TypeFacts& record : records.types) {
         enterType(record.id, 0);
     }
     enterProperties();
@@ -89,7 +89,7 @@ ClassDefinition* MetaRegistration::enterClass(const GUID& id, int depth) {
     }
     RefPtr<ClassDefinition> definition(new ClassDefinition);
     definition->JoinModel(model_);
-    definition->SetIdentity(id, wideOf(record.name));
+    definition->SetIdentity(id, record.name);
     definition->SetParent(parent);
     definition->SetConcrete(record.concrete);
     return model_.RegisterClass(*definition) < 0 ? nullptr : model_.FindClass(id);
@@ -107,17 +107,16 @@ TypeDefinition* MetaRegistration::enterType(const GUID& id, int depth) {
     return makeType(*found->second, depth);
 }
 
-TypeDefinition* MetaRegistration::makeType(const MetaType& record, int depth) {
-    if (refersToClass(record.kind)) {
+TypeDefinition* MetaRegistration::makeType(const TypeFacts& record, int depth) {
+    if (RefersToClass(record.kind)) {
         if (model_.FindClass(record.target) == nullptr) {
             return nullptr;
         }
-    } else if (kindClass(record.kind).targetPid != 0 &&
-               enterType(record.target, depth + 1) == nullptr) {
+    } else if (targetPidOf(record.kind) != 0 && enterType(record.target, depth + 1) == nullptr) {
         return nullptr;
     }
     if (record.kind == TypeKind::Record) {
-        for (const MetaMember& member : record.members) {
+        for (const TypeMember& member : record.members) {
             if (enterType(member.id, depth + 1) == nullptr) {
                 return nullptr;
             }
@@ -152,9 +151,8 @@ void MetaRegistration::enterProperties() {
     });
     for (const auto& [owner, property] : added) {
         if (model_.FindProperty(property->id) == nullptr) {
-            model_.FindClass(owner->id)->AddProperty(property->id, wideOf(property->name),
-                                                     property->type, property->optional,
-                                                     property->unique);
+            model_.FindClass(owner->id)->AddProperty(property->id, property->name, property->type,
+                                                     property->optional, property->unique);
         }
     }
 }

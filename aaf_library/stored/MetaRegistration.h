@@ -33,12 +33,12 @@ public:
 private:
     ClassDefinition* enterClass(const GUID& id, int depth);
     TypeDefinition* enterType(const GUID& id, int depth);
-    TypeDefinition* makeType(const MetaType& record, int depth);
+    TypeDefinition* makeType(const TypeFacts& record, int depth);
     void enterProperties();
 
     Model& model_;
     std::unordered_map<GUID, const MetaClass*, GuidHash> classes_;
-    std::unordered_map<GUID, const MetaType*, GuidHash> types_;
+    std::unordered_map<GUID, const TypeFacts*, GuidHash> types_;
     std::unordered_set<GUID, GuidHash> begun_;
     // For each class of the file its own numbers.
     std::unordered_map<GUID, std::unordered_map<std::uint16_t, GUID>, GuidHash> pids_;

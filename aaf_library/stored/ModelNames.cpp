@@ -27,6 +27,10 @@ std::wstring wideOf(const std::u16string& text) {
     return FromUtf16(stored.bytes().data(), stored.bytes().size());
 }
 
+std::string toUtf8(const std::wstring& text) {
+    return toUtf8(utf16Of(text));
+}
+
 StoredForm storedFormOf(const TypeDefinition& type) {
     switch (type.form()) {
         case ValueForm::Stream:

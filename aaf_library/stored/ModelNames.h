@@ -3,6 +3,7 @@
 #pragma once
 
 #include "aaf_library/stored/MetaRecords.h"
+#include "aaf_library/stored/StoredNames.h"
 
 #include <string>
 
@@ -16,6 +17,8 @@ namespace aaf::stored {
 
 std::u16string utf16Of(const std::wstring& text);
 std::wstring wideOf(const std::u16string& text);
+// For messages, as toUtf8 of StoredNames.h.
+std::string toUtf8(const std::wstring& text);
 
 // Form in which a property of that type is stored.
 StoredForm storedFormOf(const TypeDefinition& type);

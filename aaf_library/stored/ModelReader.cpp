@@ -51,12 +51,12 @@ private:
             throw StoredError("an object of a class that is not defined");
         }
         if (!definition->IsKindOf(expected)) {
-            throw StoredError("an object of the class " + toUtf8(utf16Of(definition->name())) +
+            throw StoredError("an object of the class " + toUtf8(definition->name()) +
                               " in a place for others");
         }
         RefPtr<Object> object = model_.CreateObject(*definition, false);
         if (!object) {
-            throw StoredError("an object of the class " + toUtf8(utf16Of(definition->name())) +
+            throw StoredError("an object of the class " + toUtf8(definition->name()) +
                               " cannot be made");
         }
         return object;
@@ -77,7 +77,7 @@ private:
                     throw StoredError("an object cannot hold it");
                 }
             } catch (const StoredError& problem) {
-                throw StoredError(toUtf8(utf16Of(definition->name())) + ": " + problem.what());
+                throw StoredError(toUtf8(definition->name()) + ": " + problem.what());
             }
         }
     }
@@ -136,7 +136,7 @@ private:
     }
 
     void addObjects(PropertyValue& value, const TypeDefinition& type, const StoredProperty& from) {
-        const GUID expected = recordOf(referenceIn(type)).target;
+        const GUID expected = FactsOf(referenceIn(type)).target;
         for (std::size_t i = 0; i < from.objects.size(); ++i) {
             const RefPtr<Object> object = newObject(from.objects[i], expected);
             fill(*object, from.objects[i]);
@@ -171,7 +171,7 @@ private:
             try {
                 mergeSet(dictionary, *definition, property);
             } catch (const StoredError& problem) {
-                throw StoredError(toUtf8(utf16Of(definition->name())) + ": " + problem.what());
+                throw StoredError(toUtf8(definition->name()) + ": " + problem.what());
             }
         }
         fill(dictionary, others);
@@ -179,7 +179,7 @@ private:
 
     void mergeSet(Dictionary& dictionary, const PropertyDefinition& definition,
                   const StoredProperty& from) {
-        const GUID expected = recordOf(referenceIn(*definition.type())).target;
+        const GUID expected = FactsOf(referenceIn(*definition.type())).target;
         for (std::size_t i = 0; i < from.objects.size(); ++i) {
             const Bytes& key = from.keys[i];
             Object* known = dictionary.FindInSet(definition.key(), key.data(), key.size());

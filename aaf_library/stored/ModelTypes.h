@@ -15,12 +15,9 @@ namespace aaf::stored {
 // Pids from here on mean something else in every file.
 inline constexpr std::uint16_t firstLocalPid = 0x8000;
 
-// The type with all that its definition says.
-MetaType recordOf(const TypeDefinition& type);
-
 // A free type made of the record. Everything that it refers to must be in the
 // model. Null when the record makes no sense, such as an integer of 3 bytes or
 // a value that is larger than any that can be stored.
-RefPtr<TypeDefinition> typeOf(const MetaType& record, Model& model);
+RefPtr<TypeDefinition> typeOf(const TypeFacts& record, Model& model);
 
 }  // namespace aaf::stored

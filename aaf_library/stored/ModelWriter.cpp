@@ -143,7 +143,7 @@ private:
         out.name = utf16Of(definition.name());
         out.form = storedFormOf(*definition.type());
         if (out.form == StoredForm::StrongSet) {
-            const MetaType target = recordOf(referenceIn(*definition.type()));
+            const TypeFacts target = FactsOf(referenceIn(*definition.type()));
             const PropertyDefinition* key = keyOf(target.target);
             out.keyPid = key->pid();
             out.keySize = static_cast<std::uint8_t>(key->type()->StoredSize());
@@ -162,8 +162,8 @@ private:
     }
 
     void addTargets(StoredProperty& out, const TypeDefinition& type, const Bytes& ids) {
-        const MetaType reference = recordOf(referenceIn(type));
-        for (const MetaMember& step : reference.members) {
+        const TypeFacts reference = FactsOf(referenceIn(type));
+        for (const TypeMember& step : reference.members) {
             out.targetPath.push_back(pidOf(step.id));
         }
         out.keyPid = keyOf(reference.target)->pid();
@@ -220,8 +220,8 @@ private:
             }
             StoredProperty empty = emptyProperty(*definition);
             if (empty.form == StoredForm::StrongReference) {
-                throw StoredError(toUtf8(utf16Of(from.classDefinition().name())) + " has no " +
-                                  toUtf8(utf16Of(definition->name())));
+                throw StoredError(toUtf8(from.classDefinition().name()) + " has no " +
+                                  toUtf8(definition->name()));
             }
             out.properties.push_back(std::move(empty));
         }
@@ -318,7 +318,7 @@ private:
     }
 
     static std::string text(const PropertyDefinition& definition) {
-        return toUtf8(utf16Of(definition.name()));
+        return toUtf8(definition.name());
     }
 
     Model& model_;

@@ -8,9 +8,9 @@ namespace aaf::stored::sample {
 
 namespace {
 
-std::u16string wide(const char* ascii) {
+std::wstring wide(const char* ascii) {
     const std::string text(ascii);
-    return std::u16string(text.begin(), text.end());
+    return std::wstring(text.begin(), text.end());
 }
 
 }  // namespace
@@ -29,7 +29,7 @@ MetaRecords builtInRecords() {
         records.classes.push_back(record);
     }
     for (const BuiltInType& entry : BuiltInTypes()) {
-        MetaType record;
+        TypeFacts record;
         record.id = entry.id;
         record.name = wide(entry.symbol);
         record.kind = entry.kind;
@@ -38,7 +38,7 @@ MetaRecords builtInRecords() {
         record.isSigned = entry.isSigned;
         for (const BuiltInMember& member : entry.members) {
             const bool named = entry.kind != TypeKind::WeakReference;
-            record.members.push_back({named ? wide(member.name) : u"", member.id, member.value});
+            record.members.push_back({named ? wide(member.name) : L"", member.id, member.value});
         }
         records.types.push_back(record);
     }

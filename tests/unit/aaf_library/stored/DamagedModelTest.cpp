@@ -137,10 +137,10 @@ TEST(DamagedModel, TypesThatAreMadeOfThemselvesAreLeftOut) {
     StoredObject tree = sampleTree();
     MetaRecords records;
     for (std::uint8_t i = 0; i < 3; ++i) {
-        MetaType type;
+        TypeFacts type;
         type.id = ncfGuid("11111111-0000-0000-0000-000000000000");
         type.id.Data4[7] = i;
-        type.name = u"Circle";
+        type.name = L"Circle";
         type.kind = TypeKind::Rename;
         type.target = type.id;
         type.target.Data4[7] = static_cast<std::uint8_t>((i + 1) % 3);
@@ -158,10 +158,10 @@ TEST(DamagedModel, ALongLineOfTypesIsRefused) {
     StoredObject tree = sampleTree();
     MetaRecords records;
     for (std::uint32_t i = 0; i < 5000; ++i) {
-        MetaType type;
+        TypeFacts type;
         type.id = ncfGuid("11111111-0000-0000-0000-000000000000");
         type.id.Data1 = 0x20000000 + i;
-        type.name = u"Line";
+        type.name = L"Line";
         type.kind = TypeKind::Rename;
         type.target = type.id;
         ++type.target.Data1;
@@ -177,9 +177,9 @@ TEST(DamagedModel, ALongLineOfTypesIsRefused) {
 
 TEST(DamagedModel, AnArrayTypeLargerThanAnyValueIsLeftOut) {
     MetaRecords records;
-    MetaType type;
+    TypeFacts type;
     type.id = ncfGuid("11111111-0000-0000-0000-000000000000");
-    type.name = u"Huge";
+    type.name = L"Huge";
     type.kind = TypeKind::FixedArray;
     type.target = ncfGuid("01010300-0000-0000-060E-2B3401040101");
     type.size = 0xFFFFFFFF;

@@ -19,18 +19,18 @@ namespace {
 constexpr GUID quadId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E01");
 constexpr GUID rationalId = ncfGuid("03010100-0000-0000-060E-2B3401040101");
 
-MetaType quad() {
-    MetaType type;
+TypeFacts quad() {
+    TypeFacts type;
     type.id = quadId;
-    type.name = u"ExampleQuad";
+    type.name = L"ExampleQuad";
     type.kind = TypeKind::Record;
-    for (const char16_t* name : {u"Left", u"Top", u"Right", u"Bottom"}) {
+    for (const wchar_t* name : {L"Left", L"Top", L"Right", L"Bottom"}) {
         type.members.push_back({name, rationalId, 0});
     }
     return type;
 }
 
-MetaRecords oneType(MetaType type) {
+MetaRecords oneType(TypeFacts type) {
     MetaRecords records;
     records.types.push_back(std::move(type));
     return records;
@@ -97,8 +97,8 @@ TEST(MetaDictionary, EveryBuiltInDefinitionComesBackFromTheFile) {
     }
     ASSERT_EQ(read.types.size(), wanted.types.size());
     for (std::size_t i = 0; i < wanted.types.size(); ++i) {
-        const MetaType& a = read.types[i];
-        const MetaType& b = wanted.types[i];
+        const TypeFacts& a = read.types[i];
+        const TypeFacts& b = wanted.types[i];
         EXPECT_EQ(a.id, b.id);
         EXPECT_EQ(a.name, b.name);
         EXPECT_EQ(a.kind, b.kind);
@@ -176,9 +176,9 @@ TEST(MetaDictionary, NamesAndMembersThatDoNotPairAreRefused) {
 }
 
 TEST(MetaDictionary, AValueOfTheWrongSizeIsRefused) {
-    MetaType type;
+    TypeFacts type;
     type.id = quadId;
-    type.name = u"Odd";
+    type.name = L"Odd";
     type.kind = TypeKind::FixedArray;
     type.size = 3;
     StoredObject dictionary = storedMetaDictionary(oneType(type));

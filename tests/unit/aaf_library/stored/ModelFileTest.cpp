@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/ModelFile.h"
+#include "aaf_library/stored/ModelNames.h"
 
 #include "aaf_library/model/ClassDefinition.h"
 #include "aaf_library/model/TypeRecord.h"
@@ -56,8 +57,8 @@ std::string refusal(const sample::SampleModel& sample) {
     }
 }
 
-std::set<std::u16string> storedClasses(const StoredObject& root) {
-    std::set<std::u16string> names;
+std::set<std::wstring> storedClasses(const StoredObject& root) {
+    std::set<std::wstring> names;
     for (const MetaClass& entry : readMetaDictionary(child(root, 1)).classes) {
         names.insert(entry.name);
     }
@@ -218,21 +219,21 @@ TEST(ModelFile, TheMetaDictionaryHoldsWhatIsUsedAndIsClosed) {
     const sample::SampleModel sample = sample::wholeModel();
     const StoredObject tree = treeOfModel(*sample.model, *sample.header);
     const MetaRecords records = readMetaDictionary(child(tree, 1));
-    const std::set<std::u16string> names = storedClasses(tree);
-    for (const char16_t* name : {u"SourceMob", u"CDCIDescriptor", u"ExampleLocator", u"Timecode",
-                                 u"ClassDefinition", u"TypeDefinitionRecord", u"MetaDictionary",
-                                 u"PropertyDefinition", u"Header", u"DataDefinition"}) {
+    const std::set<std::wstring> names = storedClasses(tree);
+    for (const wchar_t* name : {L"SourceMob", L"CDCIDescriptor", L"ExampleLocator", L"Timecode",
+                                 L"ClassDefinition", L"TypeDefinitionRecord", L"MetaDictionary",
+                                 L"PropertyDefinition", L"Header", L"DataDefinition"}) {
         EXPECT_EQ(names.count(name), 1u) << toUtf8(name);
     }
-    EXPECT_EQ(names.count(u"RGBADescriptor"), 0u);
-    EXPECT_EQ(names.count(u"MPEGVideoDescriptor"), 0u);
+    EXPECT_EQ(names.count(L"RGBADescriptor"), 0u);
+    EXPECT_EQ(names.count(L"MPEGVideoDescriptor"), 0u);
 
     std::set<StoredAuid> classes;
     std::set<StoredAuid> types;
     for (const MetaClass& entry : records.classes) {
         classes.insert(storedAuid(entry.id));
     }
-    for (const MetaType& entry : records.types) {
+    for (const TypeFacts& entry : records.types) {
         types.insert(storedAuid(entry.id));
     }
     for (const MetaClass& entry : records.classes) {
@@ -241,14 +242,14 @@ TEST(ModelFile, TheMetaDictionaryHoldsWhatIsUsedAndIsClosed) {
             EXPECT_EQ(types.count(storedAuid(property.type)), 1u) << toUtf8(property.name);
         }
     }
-    for (const MetaType& entry : records.types) {
+    for (const TypeFacts& entry : records.types) {
         const bool isReference =
             entry.kind == TypeKind::StrongReference || entry.kind == TypeKind::WeakReference;
         if (entry.target != GUID{}) {
             EXPECT_EQ((isReference ? classes : types).count(storedAuid(entry.target)), 1u)
                 << toUtf8(entry.name);
         }
-        for (const MetaMember& member : entry.members) {
+        for (const TypeMember& member : entry.members) {
             if (entry.kind == TypeKind::Record) {
                 EXPECT_EQ(types.count(storedAuid(member.id)), 1u) << toUtf8(entry.name);
             }

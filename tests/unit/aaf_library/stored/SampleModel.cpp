@@ -70,11 +70,11 @@ private:
     }
 
     void addExtensions() {
-        MetaType quad;
+        TypeFacts quad;
         quad.id = quadTypeId;
-        quad.name = u"ExampleQuad";
+        quad.name = L"ExampleQuad";
         quad.kind = TypeKind::Record;
-        for (const char16_t* name : {u"Left", u"Top", u"Right", u"Bottom"}) {
+        for (const wchar_t* name : {L"Left", L"Top", L"Right", L"Bottom"}) {
             quad.members.push_back({name, kAAFTypeID_Rational, 0});
         }
         must(model_->RegisterType(*typeOf(quad, *model_)));

@@ -1,0 +1,209 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "aaf_library/model/TypeFacts.h"
+
+#include <algorithm>
+
+#include "aaf_library/model/Model.h"
+#include "aaf_library/model/Text.h"
+#include "aaf_library/model/TypeCharacter.h"
+#include "aaf_library/model/TypeEnumeration.h"
+#include "aaf_library/model/TypeExtendibleEnumeration.h"
+#include "aaf_library/model/TypeFixedArray.h"
+#include "aaf_library/model/TypeIndirect.h"
+#include "aaf_library/model/TypeInteger.h"
+#include "aaf_library/model/TypeRecord.h"
+#include "aaf_library/model/TypeReference.h"
+#include "aaf_library/model/TypeRename.h"
+#include "aaf_library/model/TypeSet.h"
+#include "aaf_library/model/TypeStream.h"
+#include "aaf_library/model/TypeString.h"
+#include "aaf_library/model/TypeVariableArray.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
+
+namespace aaf {
+namespace {
+
+template <class T>
+RefPtr<TypeDefinition> Make() {
+    return RefPtr<TypeDefinition>(new T);
+}
+
+struct Kind {
+    const GUID& classId;
+    eAAFTypeCategory_t category;
+    RefPtr<TypeDefinition> (*make)();
+};
+
+// In the order of TypeKind.
+const Kind kKinds[] = {
+    {AUID_AAFTypeDefInt, kAAFTypeCatInt, Make<TypeInteger>},
+    {AUID_AAFTypeDefStrongObjRef, kAAFTypeCatStrongObjRef, Make<TypeStrongReference>},
+    {AUID_AAFTypeDefWeakObjRef, kAAFTypeCatWeakObjRef, Make<TypeWeakReference>},
+    {AUID_AAFTypeDefEnum, kAAFTypeCatEnum, Make<TypeEnumeration>},
+    {AUID_AAFTypeDefFixedArray, kAAFTypeCatFixedArray, Make<TypeFixedArray>},
+    {AUID_AAFTypeDefVariableArray, kAAFTypeCatVariableArray, Make<TypeVariableArray>},
+    {AUID_AAFTypeDefSet, kAAFTypeCatSet, Make<TypeSet>},
+    {AUID_AAFTypeDefString, kAAFTypeCatString, Make<TypeString>},
+    {AUID_AAFTypeDefStream, kAAFTypeCatStream, Make<TypeStream>},
+    {AUID_AAFTypeDefRecord, kAAFTypeCatRecord, Make<TypeRecord>},
+    {AUID_AAFTypeDefRename, kAAFTypeCatRename, Make<TypeRename>},
+    {AUID_AAFTypeDefExtEnum, kAAFTypeCatExtEnum, Make<TypeExtendibleEnumeration>},
+    {AUID_AAFTypeDefIndirect, kAAFTypeCatIndirect, Make<TypeIndirect>},
+    {AUID_AAFTypeDefOpaque, kAAFTypeCatOpaque, Make<TypeOpaque>},
+    {AUID_AAFTypeDefCharacter, kAAFTypeCatCharacter, Make<TypeCharacter>},
+};
+
+const Kind& EntryOf(TypeKind kind) {
+    return kKinds[static_cast<std::size_t>(kind)];
+}
+
+HRESULT SetupRecord(TypeRecord& type, Model& model, const TypeFacts& facts) {
+    std::vector<TypeRecord::Member> members;
+    for (const TypeMember& member : facts.members) {
+        TypeDefinition* const found = model.FindType(member.id);
+        if (found == nullptr) {
+            return AAFRESULT_BAD_TYPE;
+        }
+        members.push_back({member.name, found});
+    }
+    return type.Setup(facts.id, facts.name, std::move(members));
+}
+
+HRESULT SetupWeak(TypeWeakReference& type, const TypeFacts& facts) {
+    std::vector<GUID> path;
+    for (const TypeMember& member : facts.members) {
+        path.push_back(member.id);
+    }
+    return type.Setup(facts.id, facts.name, facts.target, std::move(path));
+}
+
+template <class T>
+HRESULT SetupOn(TypeDefinition* target, TypeDefinition& type, const TypeFacts& facts) {
+    return target == nullptr ? AAFRESULT_BAD_TYPE
+                             : static_cast<T&>(type).Setup(facts.id, facts.name, *target);
+}
+
+HRESULT Setup(TypeDefinition& type, Model& model, const TypeFacts& facts) {
+    const auto& [id, name, kind, targetId, size, isSigned, members] = facts;
+    TypeDefinition* const target = RefersToClass(kind) ? nullptr : model.FindType(targetId);
+    switch (kind) {
+        case TypeKind::Integer:
+            return static_cast<TypeInteger&>(type).Setup(id, name, size, isSigned);
+        case TypeKind::StrongReference:
+            return static_cast<TypeStrongReference&>(type).Setup(id, name, targetId);
+        case TypeKind::WeakReference:
+            return SetupWeak(static_cast<TypeWeakReference&>(type), facts);
+        case TypeKind::Enumeration:
+            return target == nullptr
+                       ? AAFRESULT_BAD_TYPE
+                       : static_cast<TypeEnumeration&>(type).Setup(id, name, *target, members);
+        case TypeKind::ExtendibleEnumeration:
+            return static_cast<TypeExtendibleEnumeration&>(type).Setup(id, name, members);
+        case TypeKind::FixedArray:
+            return target == nullptr
+                       ? AAFRESULT_BAD_TYPE
+                       : static_cast<TypeFixedArray&>(type).Setup(id, name, *target, size);
+        case TypeKind::Record:
+            return SetupRecord(static_cast<TypeRecord&>(type), model, facts);
+        case TypeKind::Rename:
+            return SetupOn<TypeRename>(target, type, facts);
+        case TypeKind::VariableArray:
+            return SetupOn<TypeVariableArray>(target, type, facts);
+        case TypeKind::Set:
+            return SetupOn<TypeSet>(target, type, facts);
+        case TypeKind::String:
+            return SetupOn<TypeString>(target, type, facts);
+        default:
+            return type.SetIdentity(id, name);
+    }
+}
+
+std::vector<TypeMember> MembersOf(const TypeDefinition& type) {
+    std::vector<TypeMember> members;
+    switch (type.kind()) {
+        case TypeKind::Enumeration:
+            return static_cast<const TypeEnumeration&>(type).members();
+        case TypeKind::ExtendibleEnumeration:
+            return static_cast<const TypeExtendibleEnumeration&>(type).members();
+        case TypeKind::Record:
+            for (const auto& member : static_cast<const TypeRecord&>(type).members()) {
+                members.push_back({member.name, member.type->id()});
+            }
+            return members;
+        case TypeKind::WeakReference:
+            for (const GUID& step : static_cast<const TypeWeakReference&>(type).targetSet()) {
+                members.push_back({{}, step});
+            }
+            return members;
+        default:
+            return members;
+    }
+}
+
+}  // namespace
+
+TypeFacts FactsOf(const BuiltInType& entry) {
+    TypeFacts facts{entry.id,   Widen(entry.name), entry.kind, entry.target,
+                    entry.size, entry.isSigned,    {}};
+    for (const BuiltInMember& member : entry.members) {
+        facts.members.push_back({Widen(member.name), member.id, member.value});
+    }
+    return facts;
+}
+
+TypeFacts FactsOf(const TypeDefinition& type) {
+    TypeFacts facts{type.id(), type.name(), type.kind(), {}, 0, false, MembersOf(type)};
+    if (type.element() != nullptr) {
+        facts.target = type.element()->id();
+    }
+    if (RefersToClass(facts.kind)) {
+        facts.target = static_cast<const TypeReference&>(type).targetClass();
+    }
+    if (facts.kind == TypeKind::Integer) {
+        facts.size = static_cast<std::uint32_t>(type.StoredSize());
+        facts.isSigned = static_cast<const TypeInteger&>(type).IsSignedType();
+    }
+    if (facts.kind == TypeKind::FixedArray) {
+        facts.size = static_cast<std::uint32_t>(static_cast<const TypeFixedArray&>(type).count());
+    }
+    return facts;
+}
+
+const GUID& ClassOfTypes(TypeKind kind) {
+    return EntryOf(kind).classId;
+}
+
+eAAFTypeCategory_t CategoryOf(TypeKind kind) {
+    return EntryOf(kind).category;
+}
+
+bool IsClassOfTypes(const GUID& classId, TypeKind* kind) {
+    const auto* const found =
+        std::find_if(std::begin(kKinds), std::end(kKinds),
+                     [&](const Kind& entry) { return entry.classId == classId; });
+    *kind = static_cast<TypeKind>(found - kKinds);
+    return found != std::end(kKinds);
+}
+
+RefPtr<TypeDefinition> MakeType(Model& model, TypeKind kind) {
+    RefPtr<TypeDefinition> type = EntryOf(kind).make();
+    type->JoinModel(model);
+    return type;
+}
+
+RefPtr<TypeDefinition> MakeType(Model& model, const TypeFacts& facts) {
+    RefPtr<TypeDefinition> type = MakeType(model, facts.kind);
+    return Setup(*type, model, facts) < 0 ? nullptr : type;
+}
+
+RefPtr<TypeDefinition> MakeBuiltInType(Model& model, const BuiltInType& entry) {
+    RefPtr<TypeDefinition> type = MakeType(model, FactsOf(entry));
+    type->MarkBuiltIn();
+    if (entry.kind == TypeKind::Record) {
+        static_cast<TypeRecord&>(*type).UseNaturalLayout();
+    }
+    return type;
+}
+
+}  // namespace aaf

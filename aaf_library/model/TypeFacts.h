@@ -1,0 +1,45 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "aaf_library/model/TypeDefinition.h"
+
+// All that the definition of a type says, as plain values. What is built in, what
+// comes from another model and what a file's meta-dictionary holds become types by
+// them, and a type is stored by them.
+
+namespace aaf {
+
+struct TypeFacts {
+    GUID id{};
+    std::wstring name;
+    TypeKind kind = TypeKind::Integer;
+    GUID target{};           // element, renamed or character type; class referred to
+    std::uint32_t size = 0;  // integer: bytes; fixed array: elements
+    bool isSigned = false;   // integer
+    std::vector<TypeMember> members;
+};
+
+TypeFacts FactsOf(const BuiltInType& entry);
+TypeFacts FactsOf(const TypeDefinition& type);
+
+// References name a class; all other targets are types.
+inline bool RefersToClass(TypeKind kind) {
+    return kind == TypeKind::StrongReference || kind == TypeKind::WeakReference;
+}
+
+// The class of the definitions of one kind, and the other way round: false for a class of
+// anything else.
+const GUID& ClassOfTypes(TypeKind kind);
+bool IsClassOfTypes(const GUID& classId, TypeKind* kind);
+inline constexpr int kTypeKinds = static_cast<int>(TypeKind::Character) + 1;
+eAAFTypeCategory_t CategoryOf(TypeKind kind);
+
+// An empty type of a model.
+RefPtr<TypeDefinition> MakeType(Model& model, TypeKind kind);
+// A free type with these facts; null when the model lacks a type that they name.
+RefPtr<TypeDefinition> MakeType(Model& model, const TypeFacts& facts);
+// The definition of a built-in type, free; makes those that it is built of in the model.
+RefPtr<TypeDefinition> MakeBuiltInType(Model& model, const BuiltInType& entry);
+
+}  // namespace aaf
