@@ -40,7 +40,7 @@ HRESULT Guarded(Operation operation) {
 // The kind that a file carries, if it is one that this library can read.
 bool FindKind(aafCharacter_constptr fileName, aafUID_t& kind) {
     aaf::stored::SectorSize sectors{};
-    if (!aaf::stored::isAafFile(aaf::PathOf(fileName), &sectors)) {
+    if (!aaf::stored::IsAafFile(aaf::PathOf(fileName), &sectors)) {
         return false;
     }
     kind = sectors == aaf::stored::SectorSize::Bytes4096 ? kAAFFileKind_Aaf4KBinary

@@ -15,7 +15,7 @@ namespace aaf {
 HRESULT CopyExtensions(Model& source, Model& target) {
     try {
         stored::MetaClosure closure(source);
-        closure.addExtensions();
+        closure.AddExtensions();
         const stored::MetaRegistration registration(closure.records(), target);
         return AAFRESULT_SUCCESS;
     } catch (const stored::StoredError& problem) {

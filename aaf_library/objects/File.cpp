@@ -135,7 +135,7 @@ HRESULT File::Load(aafCharacter_constptr path, aafUInt32 modeFlags) {
     saved_ = true;
     model_ = Model::Create(ObjectClasses());
     RefPtr<Object> read;
-    result = ResultOf(stored::loadModel(path_, *model_, read), AAFRESULT_NOT_READABLE);
+    result = ResultOf(stored::LoadModel(path_, *model_, read), AAFRESULT_NOT_READABLE);
     if (result < 0) {
         return result;
     }
@@ -144,7 +144,7 @@ HRESULT File::Load(aafCharacter_constptr path, aafUInt32 modeFlags) {
         return AAFRESULT_BADHEAD;
     }
     stored::SectorSize sectors{};
-    largeSectors_ = stored::isAafFile(path_, &sectors) && sectors == stored::SectorSize::Bytes4096;
+    largeSectors_ = stored::IsAafFile(path_, &sectors) && sectors == stored::SectorSize::Bytes4096;
     header_ = header;
     return AAFRESULT_SUCCESS;
 }
@@ -195,7 +195,7 @@ HRESULT File::Save() {
     if (access_ == Access::Transient) {
         // Nothing is written, but what could not be written is told.
         try {
-            stored::treeOfModel(*model_, *header_);
+            stored::TreeOfModel(*model_, *header_);
         } catch (const stored::StoredError& problem) {
             TellDiagnostic(problem.what());
             result = AAFRESULT_INVALID_OBJ;
@@ -204,7 +204,7 @@ HRESULT File::Save() {
         const auto sectors =
             largeSectors_ ? stored::SectorSize::Bytes4096 : stored::SectorSize::Bytes512;
         result =
-            ResultOf(stored::saveModel(*model_, *header_, path_, sectors), AAFRESULT_NOT_WRITEABLE);
+            ResultOf(stored::SaveModel(*model_, *header_, path_, sectors), AAFRESULT_NOT_WRITEABLE);
     }
     saved_ = result >= 0;
     TellProgress();

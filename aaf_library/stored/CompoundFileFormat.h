@@ -23,31 +23,31 @@
 
 namespace aaf::stored {
 
-inline constexpr std::uint8_t compoundMagic[8] = {0xD0, 0xCF, 0x11, 0xE0, 0xA1, 0xB1, 0x1A, 0xE1};
+inline constexpr std::uint8_t kCompoundMagic[8] = {0xD0, 0xCF, 0x11, 0xE0, 0xA1, 0xB1, 0x1A, 0xE1};
 
-inline constexpr std::size_t headerSize = 512;
-inline constexpr std::size_t signatureOffset = 8;
-inline constexpr std::size_t sectorShiftOffset = 30;
-inline constexpr std::size_t tableCountOffset = 44;
-inline constexpr std::size_t firstDirectoryOffset = 48;
-inline constexpr std::size_t smallLimitOffset = 56;
-inline constexpr std::size_t firstSmallTableOffset = 60;
-inline constexpr std::size_t firstTableListOffset = 68;
-inline constexpr std::size_t tableListOffset = 76;
-inline constexpr std::uint32_t headerTableCount = 109;
+inline constexpr std::size_t kHeaderSize = 512;
+inline constexpr std::size_t kSignatureOffset = 8;
+inline constexpr std::size_t kSectorShiftOffset = 30;
+inline constexpr std::size_t kTableCountOffset = 44;
+inline constexpr std::size_t kFirstDirectoryOffset = 48;
+inline constexpr std::size_t kSmallLimitOffset = 56;
+inline constexpr std::size_t kFirstSmallTableOffset = 60;
+inline constexpr std::size_t kFirstTableListOffset = 68;
+inline constexpr std::size_t kTableListOffset = 76;
+inline constexpr std::uint32_t kHeaderTableCount = 109;
 
-inline constexpr std::size_t directoryEntrySize = 128;
-inline constexpr std::uint32_t smallSectorSize = 64;
-inline constexpr std::uint32_t smallStreamLimit = 4096;
+inline constexpr std::size_t kDirectoryEntrySize = 128;
+inline constexpr std::uint32_t kSmallSectorSize = 64;
+inline constexpr std::uint32_t kSmallStreamLimit = 4096;
 
-inline constexpr std::uint32_t freeSector = 0xFFFFFFFF;
-inline constexpr std::uint32_t endOfChain = 0xFFFFFFFE;
-inline constexpr std::uint32_t lastPlainSector = 0xFFFFFFFA;
+inline constexpr std::uint32_t kFreeSector = 0xFFFFFFFF;
+inline constexpr std::uint32_t kEndOfChain = 0xFFFFFFFE;
+inline constexpr std::uint32_t kLastPlainSector = 0xFFFFFFFA;
 
 // The two kinds of AAF file differ in the size of their sectors.
-inline constexpr StoredAuid signature512 = {0x41, 0x41, 0x46, 0x42, 0x0D, 0x00, 0x4F, 0x4D,
-                                            0x06, 0x0E, 0x2B, 0x34, 0x01, 0x01, 0x01, 0xFF};
-inline constexpr StoredAuid signature4096 = {0x01, 0x02, 0x01, 0x0D, 0x00, 0x02, 0x00, 0x00,
-                                             0x06, 0x0E, 0x2B, 0x34, 0x03, 0x02, 0x01, 0x01};
+inline constexpr StoredAuid kSignature512 = {0x41, 0x41, 0x46, 0x42, 0x0D, 0x00, 0x4F, 0x4D,
+                                             0x06, 0x0E, 0x2B, 0x34, 0x01, 0x01, 0x01, 0xFF};
+inline constexpr StoredAuid kSignature4096 = {0x01, 0x02, 0x01, 0x0D, 0x00, 0x02, 0x00, 0x00,
+                                              0x06, 0x0E, 0x2B, 0x34, 0x03, 0x02, 0x01, 0x01};
 
 }  // namespace aaf::stored

@@ -11,22 +11,22 @@ namespace aaf::stored {
 
 namespace {
 
-constexpr std::size_t longestNameBytes = 64;  // with the terminator
+constexpr std::size_t kLongestNameBytes = 64;  // with the terminator
 
-std::uint32_t numberIn(const std::uint8_t* bytes) {
+std::uint32_t NumberIn(const std::uint8_t* bytes) {
     return ByteReader(bytes, 4).number<std::uint32_t>();
 }
 
-CompoundFileReader::Entry parseEntry(const std::uint8_t* bytes) {
+CompoundFileReader::Entry ParseEntry(const std::uint8_t* bytes) {
     CompoundFileReader::Entry entry;
-    ByteReader from(bytes, directoryEntrySize);
-    const Bytes units = from.bytes(longestNameBytes);
+    ByteReader from(bytes, kDirectoryEntrySize);
+    const Bytes units = from.bytes(kLongestNameBytes);
     const auto length = from.number<std::uint16_t>();
     entry.kind = CompoundFileReader::Kind(from.number<std::uint8_t>());
     if (entry.kind == CompoundFileReader::Kind::Unused) {
         return entry;
     }
-    if (length < 4 || length > longestNameBytes || length % 2 != 0) {
+    if (length < 4 || length > kLongestNameBytes || length % 2 != 0) {
         throw StoredError("a directory entry with a name of " + std::to_string(length) + " bytes");
     }
     entry.name = ByteReader(units.data(), length).text();
@@ -45,50 +45,50 @@ CompoundFileReader::Entry parseEntry(const std::uint8_t* bytes) {
 }  // namespace
 
 CompoundFileReader::CompoundFileReader(const Bytes& file) : file_(file) {
-    readHeader();
-    readAllocationTable();
-    readDirectory();
-    readSmallStreams();
+    ReadHeader();
+    ReadAllocationTable();
+    ReadDirectory();
+    ReadSmallStreams();
 }
 
-void CompoundFileReader::readHeader() {
-    if (file_.size() < headerSize ||
-        !std::equal(std::begin(compoundMagic), std::end(compoundMagic), file_.begin())) {
+void CompoundFileReader::ReadHeader() {
+    if (file_.size() < kHeaderSize ||
+        !std::equal(std::begin(kCompoundMagic), std::end(kCompoundMagic), file_.begin())) {
         throw StoredError("is no compound file");
     }
-    std::copy_n(file_.begin() + signatureOffset, signature_.size(), signature_.begin());
-    ByteReader from(file_.data() + sectorShiftOffset - 2, 6);
+    std::copy_n(file_.begin() + kSignatureOffset, signature_.size(), signature_.begin());
+    ByteReader from(file_.data() + kSectorShiftOffset - 2, 6);
     const auto order = from.number<std::uint16_t>();
     const auto shift = from.number<std::uint16_t>();
     const auto smallShift = from.number<std::uint16_t>();
     if (order != 0xFFFE || (shift != 9 && shift != 12) ||
-        1u << smallShift % 32 != smallSectorSize ||
-        headerNumber(smallLimitOffset) != smallStreamLimit) {
+        1u << smallShift % 32 != kSmallSectorSize ||
+        HeaderNumber(kSmallLimitOffset) != kSmallStreamLimit) {
         throw StoredError("a kind of compound file that AAF does not use");
     }
     sectorSize_ = 1u << shift;
     const std::size_t count = file_.size() / sectorSize_;
-    if (count < 2 || count > lastPlainSector) {
+    if (count < 2 || count > kLastPlainSector) {
         throw StoredError("the file ends after its header");
     }
     sectorCount_ = static_cast<std::uint32_t>(count - 1);
     claimed_.resize(sectorCount_);
 }
 
-void CompoundFileReader::readAllocationTable() {
+void CompoundFileReader::ReadAllocationTable() {
     const std::uint32_t perSector = sectorSize_ / 4;
-    const std::uint32_t wanted = headerNumber(tableCountOffset);
+    const std::uint32_t wanted = HeaderNumber(kTableCountOffset);
     if (wanted > sectorCount_) {
         throw StoredError("the header counts " + std::to_string(wanted) + " table sectors, " +
                           std::to_string(sectorCount_) + " sectors are in the file");
     }
     std::vector<std::uint32_t> listed;
-    for (std::uint32_t i = 0; i < std::min(wanted, headerTableCount); ++i) {
-        listed.push_back(headerNumber(tableListOffset + 4 * i));
+    for (std::uint32_t i = 0; i < std::min(wanted, kHeaderTableCount); ++i) {
+        listed.push_back(HeaderNumber(kTableListOffset + 4 * i));
     }
-    std::uint32_t at = headerNumber(firstTableListOffset);
+    std::uint32_t at = HeaderNumber(kFirstTableListOffset);
     while (listed.size() < wanted) {
-        claim(at);
+        Claim(at);
         const std::vector<std::uint32_t> more = numbers(at);
         for (std::uint32_t i = 0; i + 1 < perSector && listed.size() < wanted; ++i) {
             listed.push_back(more[i]);
@@ -97,29 +97,29 @@ void CompoundFileReader::readAllocationTable() {
     }
     table_.reserve(std::size_t{wanted} * perSector);
     for (std::uint32_t number : listed) {
-        claim(number);
+        Claim(number);
         const std::vector<std::uint32_t> part = numbers(number);
         table_.insert(table_.end(), part.begin(), part.end());
     }
     // An entry is only looked up for a sector of the file.
-    table_.resize(sectorCount_, freeSector);
+    table_.resize(sectorCount_, kFreeSector);
 }
 
-void CompoundFileReader::readDirectory() {
-    for (std::uint32_t number : chain(headerNumber(firstDirectoryOffset))) {
-        for (std::size_t at = 0; at < sectorSize_; at += directoryEntrySize) {
-            entries_.push_back(parseEntry(sector(number) + at));
+void CompoundFileReader::ReadDirectory() {
+    for (std::uint32_t number : chain(HeaderNumber(kFirstDirectoryOffset))) {
+        for (std::size_t at = 0; at < sectorSize_; at += kDirectoryEntrySize) {
+            entries_.push_back(ParseEntry(sector(number) + at));
         }
     }
     if (entries_.empty() || entries_.front().kind != Kind::Root) {
         throw StoredError("the directory has no root");
     }
     entries_.front().placed = true;
-    std::vector<std::uint32_t> storages = {rootIndex};
+    std::vector<std::uint32_t> storages = {kRootIndex};
     while (!storages.empty()) {
         const std::uint32_t storage = storages.back();
         storages.pop_back();
-        placeEntries(storage);
+        PlaceEntries(storage);
         for (const auto& contained : entries_[storage].contained) {
             if (entries_[contained.second].kind == Kind::Storage) {
                 storages.push_back(contained.second);
@@ -130,12 +130,12 @@ void CompoundFileReader::readDirectory() {
 
 // The entries of a storage are the nodes of a search tree; its order is not
 // relied on.
-void CompoundFileReader::placeEntries(std::uint32_t storage) {
+void CompoundFileReader::PlaceEntries(std::uint32_t storage) {
     std::vector<std::uint32_t> open = {entries_[storage].child};
     while (!open.empty()) {
         const std::uint32_t index = open.back();
         open.pop_back();
-        if (index == freeSector) {
+        if (index == kFreeSector) {
             continue;
         }
         if (index >= entries_.size() || entries_[index].placed) {
@@ -154,9 +154,9 @@ void CompoundFileReader::placeEntries(std::uint32_t storage) {
     }
 }
 
-void CompoundFileReader::readSmallStreams() {
-    const std::uint32_t tableStart = headerNumber(firstSmallTableOffset);
-    if (tableStart == freeSector || entries_.front().size == 0) {
+void CompoundFileReader::ReadSmallStreams() {
+    const std::uint32_t tableStart = HeaderNumber(kFirstSmallTableOffset);
+    if (tableStart == kFreeSector || entries_.front().size == 0) {
         return;
     }
     for (std::uint32_t number : chain(tableStart)) {
@@ -164,16 +164,16 @@ void CompoundFileReader::readSmallStreams() {
         smallTable_.insert(smallTable_.end(), part.begin(), part.end());
     }
     for (std::uint32_t number : chain(entries_.front().start)) {
-        appendSector(small_, number);
+        AppendSector(small_, number);
     }
     if (entries_.front().size > small_.size()) {
         throw StoredError("the small sectors end early");
     }
-    smallClaimed_.resize(small_.size() / smallSectorSize);
-    smallTable_.resize(smallClaimed_.size(), freeSector);
+    smallClaimed_.resize(small_.size() / kSmallSectorSize);
+    smallTable_.resize(smallClaimed_.size(), kFreeSector);
 }
 
-Bytes CompoundFileReader::read(std::uint32_t index) {
+Bytes CompoundFileReader::Read(std::uint32_t index) {
     const Entry& entry = entries_[index];
     // Half of the size field may hold anything in files with small sectors.
     const std::uint64_t size = sectorSize_ == 512 ? entry.size & 0xFFFFFFFF : entry.size;
@@ -184,11 +184,11 @@ Bytes CompoundFileReader::read(std::uint32_t index) {
     if (size > file_.size()) {
         throw StoredError("a stream claims " + std::to_string(size) + " bytes");
     }
-    if (size >= smallStreamLimit) {
+    if (size >= kSmallStreamLimit) {
         std::uint32_t at = entry.start;
         while (content.size() < size) {
-            claim(at);
-            appendSector(content, at);
+            Claim(at);
+            AppendSector(content, at);
             at = table_[at];
         }
     } else {
@@ -198,8 +198,8 @@ Bytes CompoundFileReader::read(std::uint32_t index) {
                 throw StoredError("a stream runs into a small sector that is not its own");
             }
             smallClaimed_[at] = true;
-            const auto from = small_.begin() + std::ptrdiff_t{at} * smallSectorSize;
-            content.insert(content.end(), from, from + smallSectorSize);
+            const auto from = small_.begin() + std::ptrdiff_t{at} * kSmallSectorSize;
+            content.insert(content.end(), from, from + kSmallSectorSize);
             at = smallTable_[at];
         }
     }
@@ -211,7 +211,7 @@ const std::uint8_t* CompoundFileReader::sector(std::uint32_t number) const {
     return file_.data() + (std::size_t{number} + 1) * sectorSize_;
 }
 
-void CompoundFileReader::appendSector(Bytes& out, std::uint32_t number) const {
+void CompoundFileReader::AppendSector(Bytes& out, std::uint32_t number) const {
     out.insert(out.end(), sector(number), sector(number) + sectorSize_);
 }
 
@@ -219,25 +219,25 @@ std::vector<std::uint32_t> CompoundFileReader::numbers(std::uint32_t number) con
     std::vector<std::uint32_t> out;
     out.reserve(sectorSize_ / 4);
     for (std::size_t at = 0; at < sectorSize_; at += 4) {
-        out.push_back(numberIn(sector(number) + at));
+        out.push_back(NumberIn(sector(number) + at));
     }
     return out;
 }
 
 std::vector<std::uint32_t> CompoundFileReader::chain(std::uint32_t first) {
     std::vector<std::uint32_t> out;
-    for (std::uint32_t at = first; at != endOfChain; at = table_[at]) {
-        claim(at);
+    for (std::uint32_t at = first; at != kEndOfChain; at = table_[at]) {
+        Claim(at);
         out.push_back(at);
     }
     return out;
 }
 
-std::uint32_t CompoundFileReader::headerNumber(std::size_t offset) const {
-    return numberIn(file_.data() + offset);
+std::uint32_t CompoundFileReader::HeaderNumber(std::size_t offset) const {
+    return NumberIn(file_.data() + offset);
 }
 
-void CompoundFileReader::claim(std::uint32_t number) {
+void CompoundFileReader::Claim(std::uint32_t number) {
     if (number >= sectorCount_) {
         throw StoredError("sector " + std::to_string(number) + " lies beyond the end of the file");
     }

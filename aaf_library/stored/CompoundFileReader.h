@@ -37,25 +37,25 @@ public:
     SectorSize sectorSize() const { return SectorSize(sectorSize_); }
     const StoredAuid& signature() const { return signature_; }
 
-    static constexpr std::uint32_t rootIndex = 0;
+    static constexpr std::uint32_t kRootIndex = 0;
     const Entry& entry(std::uint32_t index) const { return entries_[index]; }
 
     // The content of a stream; each stream can be read once.
-    Bytes read(std::uint32_t index);
+    Bytes Read(std::uint32_t index);
 
 private:
-    void readHeader();
-    void readAllocationTable();
-    void readDirectory();
-    void placeEntries(std::uint32_t storage);
-    void readSmallStreams();
+    void ReadHeader();
+    void ReadAllocationTable();
+    void ReadDirectory();
+    void PlaceEntries(std::uint32_t storage);
+    void ReadSmallStreams();
 
     const std::uint8_t* sector(std::uint32_t number) const;
-    void appendSector(Bytes& out, std::uint32_t number) const;
+    void AppendSector(Bytes& out, std::uint32_t number) const;
     std::vector<std::uint32_t> numbers(std::uint32_t number) const;
     std::vector<std::uint32_t> chain(std::uint32_t first);
-    std::uint32_t headerNumber(std::size_t offset) const;
-    void claim(std::uint32_t number);
+    std::uint32_t HeaderNumber(std::size_t offset) const;
+    void Claim(std::uint32_t number);
 
     const Bytes& file_;
     StoredAuid signature_{};

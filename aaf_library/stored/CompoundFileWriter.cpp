@@ -14,29 +14,29 @@ namespace aaf::stored {
 
 namespace {
 
-constexpr std::size_t longestName = 31;
+constexpr std::size_t kLongestName = 31;
 
 // libgsf takes any name and writes a broken entry for one that does not fit.
-std::string checkedName(const std::u16string& name) {
-    if (name.empty() || name.size() > longestName ||
+std::string CheckedName(const std::u16string& name) {
+    if (name.empty() || name.size() > kLongestName ||
         name.find_first_of(u"/\\:!") != std::u16string::npos) {
-        throw StoredError("\"" + toUtf8(name) + "\" cannot be the name of a storage or stream");
+        throw StoredError("\"" + ToUtf8(name) + "\" cannot be the name of a storage or stream");
     }
-    return toUtf8(name);
+    return ToUtf8(name);
 }
 
-std::uint32_t numberAt(const Bytes& file, std::size_t offset) {
+std::uint32_t NumberAt(const Bytes& file, std::size_t offset) {
     return ByteReader(file.data() + offset, 4).number<std::uint32_t>();
 }
 
 // In a large file with large sectors libgsf can name an allocation table
 // sector that it did not write; it would begin where the file ends. A sector
 // of free entries is what is missing.
-void appendMissingTable(Bytes& file, std::size_t sector) {
+void AppendMissingTable(Bytes& file, std::size_t sector) {
     std::size_t last = 0;
-    const std::uint32_t count = std::min(numberAt(file, tableCountOffset), headerTableCount);
+    const std::uint32_t count = std::min(NumberAt(file, kTableCountOffset), kHeaderTableCount);
     for (std::uint32_t i = 0; i < count; ++i) {
-        last = std::max<std::size_t>(last, numberAt(file, tableListOffset + 4 * i));
+        last = std::max<std::size_t>(last, NumberAt(file, kTableListOffset + 4 * i));
     }
     if (file.size() < (last + 2) * sector) {
         file.resize((last + 2) * sector, 0xFF);
@@ -59,34 +59,34 @@ StorageWriter::~StorageWriter() {
     g_object_unref(storage_);
 }
 
-void StorageWriter::setClass(const StoredAuid& classId) {
+void StorageWriter::SetClass(const StoredAuid& classId) {
     if (!gsf_outfile_msole_set_class_id(GSF_OUTFILE_MSOLE(storage_), classId.data())) {
         throw StoredError("a class id cannot be set");
     }
 }
 
 void StorageWriter::stream(const std::u16string& name, const Bytes& content) {
-    GsfOutput* stream = gsf_outfile_new_child(storage_, checkedName(name).c_str(), FALSE);
+    GsfOutput* stream = gsf_outfile_new_child(storage_, CheckedName(name).c_str(), FALSE);
     if (stream == nullptr) {
-        throw StoredError("the stream \"" + toUtf8(name) + "\" cannot be made");
+        throw StoredError("the stream \"" + ToUtf8(name) + "\" cannot be made");
     }
     const bool written = gsf_output_write(stream, content.size(), content.data());
     const bool closed = gsf_output_close(stream);
     g_object_unref(stream);
     if (!written || !closed) {
-        throw StoredError("the stream \"" + toUtf8(name) + "\" cannot be written");
+        throw StoredError("the stream \"" + ToUtf8(name) + "\" cannot be written");
     }
 }
 
 StorageWriter StorageWriter::storage(const std::u16string& name) {
-    GsfOutput* storage = gsf_outfile_new_child(storage_, checkedName(name).c_str(), TRUE);
+    GsfOutput* storage = gsf_outfile_new_child(storage_, CheckedName(name).c_str(), TRUE);
     if (storage == nullptr) {
-        throw StoredError("the storage \"" + toUtf8(name) + "\" cannot be made");
+        throw StoredError("the storage \"" + ToUtf8(name) + "\" cannot be made");
     }
     return StorageWriter(GSF_OUTFILE(storage));
 }
 
-void StorageWriter::close() {
+void StorageWriter::Close() {
     if (!gsf_output_close(GSF_OUTPUT(storage_))) {
         throw StoredError("a storage cannot be closed");
     }
@@ -95,7 +95,7 @@ void StorageWriter::close() {
 CompoundFileWriter::CompoundFileWriter(SectorSize sectorSize)
     : sectorSize_(sectorSize), sink_(gsf_output_memory_new()) {
     GsfOutfile* file = gsf_outfile_msole_new_full(sink_, static_cast<guint>(sectorSize),
-                                                  static_cast<guint>(smallSectorSize));
+                                                  static_cast<guint>(kSmallSectorSize));
     root_.reset(new StorageWriter(file));
 }
 
@@ -104,14 +104,14 @@ CompoundFileWriter::~CompoundFileWriter() {
     g_object_unref(sink_);
 }
 
-Bytes CompoundFileWriter::finish() {
-    root_->close();
+Bytes CompoundFileWriter::Finish() {
+    root_->Close();
     const guint8* bytes = gsf_output_memory_get_bytes(GSF_OUTPUT_MEMORY(sink_));
     Bytes file(bytes, bytes + gsf_output_size(sink_));
     const bool small = sectorSize_ == SectorSize::Bytes512;
-    const StoredAuid& signature = small ? signature512 : signature4096;
-    std::copy(signature.begin(), signature.end(), file.begin() + signatureOffset);
-    appendMissingTable(file, static_cast<std::size_t>(sectorSize_));
+    const StoredAuid& signature = small ? kSignature512 : kSignature4096;
+    std::copy(signature.begin(), signature.end(), file.begin() + kSignatureOffset);
+    AppendMissingTable(file, static_cast<std::size_t>(sectorSize_));
     return file;
 }
 

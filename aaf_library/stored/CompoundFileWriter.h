@@ -22,10 +22,10 @@ public:
     StorageWriter(const StorageWriter&) = delete;
     ~StorageWriter();
 
-    void setClass(const StoredAuid& classId);
+    void SetClass(const StoredAuid& classId);
     void stream(const std::u16string& name, const Bytes& content);
     StorageWriter storage(const std::u16string& name);
-    void close();
+    void Close();
 
 private:
     friend class CompoundFileWriter;
@@ -45,7 +45,7 @@ public:
     StorageWriter& root() { return *root_; }
 
     // Closes the root and gives the whole file, signature included.
-    Bytes finish();
+    Bytes Finish();
 
 private:
     SectorSize sectorSize_;

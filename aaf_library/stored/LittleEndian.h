@@ -21,7 +21,7 @@ public:
         return *this;
     }
     template <typename Range>
-    ByteWriter& append(const Range& range) {
+    ByteWriter& Append(const Range& range) {
         bytes_.insert(bytes_.end(), range.begin(), range.end());
         return *this;
     }
@@ -48,7 +48,7 @@ public:
 
     template <typename Number>
     Number number() {
-        const std::uint8_t* from = take(sizeof(Number));
+        const std::uint8_t* from = Take(sizeof(Number));
         std::uint64_t value = 0;
         for (std::size_t i = 0; i < sizeof(Number); ++i) {
             value |= std::uint64_t{from[i]} << 8 * i;
@@ -56,7 +56,7 @@ public:
         return static_cast<Number>(value);
     }
     Bytes bytes(std::size_t size) {
-        const std::uint8_t* from = take(size);
+        const std::uint8_t* from = Take(size);
         return Bytes(from, from + size);
     }
     // The rest as a text, which must end with its only terminator.
@@ -76,7 +76,7 @@ public:
     std::size_t left() const { return left_; }
 
 private:
-    const std::uint8_t* take(std::size_t size) {
+    const std::uint8_t* Take(std::size_t size) {
         if (size > left_) {
             throw StoredError(std::to_string(size) + " bytes wanted, " + std::to_string(left_) +
                               " left");

@@ -17,14 +17,14 @@ namespace aaf::stored {
 
 namespace {
 
-bool isExtended(const ClassDefinition& definition) {
+bool IsExtended(const ClassDefinition& definition) {
     return !definition.IsBuiltIn() ||
            std::any_of(
                definition.properties().begin(), definition.properties().end(),
                [](const RefPtr<PropertyDefinition>& property) { return !property->IsBuiltIn(); });
 }
 
-MetaClass recordOf(const ClassDefinition& definition) {
+MetaClass RecordOf(const ClassDefinition& definition) {
     MetaClass record;
     record.id = definition.id();
     record.name = definition.name();
@@ -45,56 +45,56 @@ MetaClass recordOf(const ClassDefinition& definition) {
 
 }  // namespace
 
-void MetaClosure::addClass(const GUID& id) {
+void MetaClosure::AddClass(const GUID& id) {
     pendingClasses_.push_back(id);
-    addPending();
+    AddPending();
 }
 
-void MetaClosure::addType(const GUID& id) {
+void MetaClosure::AddType(const GUID& id) {
     pendingTypes_.push_back(id);
-    addPending();
+    AddPending();
 }
 
-void MetaClosure::addMetaClasses() {
+void MetaClosure::AddMetaClasses() {
     for (const GUID& id : {AUID_AAFClassDef, AUID_AAFPropertyDef, AUID_AAFMetaDictionary}) {
-        addClass(id);
+        AddClass(id);
     }
     for (int kind = 0; kind < kTypeKinds; ++kind) {
-        addClass(ClassOfTypes(static_cast<TypeKind>(kind)));
+        AddClass(ClassOfTypes(static_cast<TypeKind>(kind)));
     }
 }
 
-void MetaClosure::addExtensions() {
+void MetaClosure::AddExtensions() {
     // Entering a definition may look up others, which makes the lists longer.
     for (std::size_t i = 0; i < model_.classes().size(); ++i) {
         const RefPtr<ClassDefinition> definition = model_.classes()[i];
-        if (isExtended(*definition)) {
-            addClass(definition->id());
+        if (IsExtended(*definition)) {
+            AddClass(definition->id());
         }
     }
     for (std::size_t i = 0; i < model_.types().size(); ++i) {
         const RefPtr<TypeDefinition> type = model_.types()[i];
         if (!type->IsBuiltIn()) {
-            addType(type->id());
+            AddType(type->id());
         }
     }
 }
 
-void MetaClosure::addPending() {
+void MetaClosure::AddPending() {
     while (!pendingClasses_.empty() || !pendingTypes_.empty()) {
         if (!pendingClasses_.empty()) {
             const GUID id = pendingClasses_.back();
             pendingClasses_.pop_back();
-            enterClass(id);
+            EnterClass(id);
         } else {
             const GUID id = pendingTypes_.back();
             pendingTypes_.pop_back();
-            enterType(id);
+            EnterType(id);
         }
     }
 }
 
-void MetaClosure::enterClass(const GUID& id) {
+void MetaClosure::EnterClass(const GUID& id) {
     if (!classes_.insert(id).second) {
         return;
     }
@@ -102,7 +102,7 @@ void MetaClosure::enterClass(const GUID& id) {
     if (definition == nullptr) {
         throw StoredError("a class that is needed has no definition");
     }
-    records_.classes.push_back(recordOf(*definition));
+    records_.classes.push_back(RecordOf(*definition));
     const MetaClass& record = records_.classes.back();
     pendingClasses_.push_back(record.parent);
     for (const MetaProperty& property : record.properties) {
@@ -110,7 +110,7 @@ void MetaClosure::enterClass(const GUID& id) {
     }
 }
 
-void MetaClosure::enterType(const GUID& id) {
+void MetaClosure::EnterType(const GUID& id) {
     if (!types_.insert(id).second) {
         return;
     }
@@ -122,7 +122,7 @@ void MetaClosure::enterType(const GUID& id) {
     const TypeFacts& record = records_.types.back();
     if (RefersToClass(record.kind)) {
         pendingClasses_.push_back(record.target);
-    } else if (targetPidOf(record.kind) != 0) {
+    } else if (TargetPidOf(record.kind) != 0) {
         pendingTypes_.push_back(record.target);
     }
     if (record.kind == TypeKind::Record) {

@@ -21,20 +21,20 @@ public:
 
     // Throw StoredError when the model has no such definition, or lacks one
     // that it needs.
-    void addClass(const GUID& id);
-    void addType(const GUID& id);
+    void AddClass(const GUID& id);
+    void AddType(const GUID& id);
 
     // The classes that the definitions themselves belong to.
-    void addMetaClasses();
+    void AddMetaClasses();
     // Whatever was registered beyond the built-in model.
-    void addExtensions();
+    void AddExtensions();
 
     const MetaRecords& records() const { return records_; }
 
 private:
-    void addPending();
-    void enterClass(const GUID& id);
-    void enterType(const GUID& id);
+    void AddPending();
+    void EnterClass(const GUID& id);
+    void EnterType(const GUID& id);
 
     Model& model_;
     MetaRecords records_;

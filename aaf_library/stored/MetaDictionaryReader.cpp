@@ -11,29 +11,29 @@ namespace aaf::stored {
 namespace {
 
 const StoredProperty* find(const StoredObject& object, std::uint16_t pid, StoredForm form) {
-    const StoredProperty* property = object.find(pid);
+    const StoredProperty* property = object.Find(pid);
     return property != nullptr && property->form == form ? property : nullptr;
 }
 
-const Bytes& requiredData(const StoredObject& object, std::uint16_t pid) {
+const Bytes& RequiredData(const StoredObject& object, std::uint16_t pid) {
     const StoredProperty* property = find(object, pid, StoredForm::Data);
     if (property == nullptr) {
-        throw StoredError(propertyText(pid) + " is missing");
+        throw StoredError(PropertyText(pid) + " is missing");
     }
     return property->bytes;
 }
 
-const StoredProperty& requiredSet(const StoredObject& object, std::uint16_t pid) {
+const StoredProperty& RequiredSet(const StoredObject& object, std::uint16_t pid) {
     const StoredProperty* property = find(object, pid, StoredForm::StrongSet);
     if (property == nullptr) {
-        throw StoredError(propertyText(pid) + " is missing");
+        throw StoredError(PropertyText(pid) + " is missing");
     }
     return *property;
 }
 
 template <typename Number>
-Number requiredNumber(const StoredObject& object, std::uint16_t pid) {
-    return ByteReader(requiredData(object, pid)).number<Number>();
+Number RequiredNumber(const StoredObject& object, std::uint16_t pid) {
+    return ByteReader(RequiredData(object, pid)).number<Number>();
 }
 
 bool flag(const StoredObject& object, std::uint16_t pid, bool absent) {
@@ -41,16 +41,16 @@ bool flag(const StoredObject& object, std::uint16_t pid, bool absent) {
     return property == nullptr ? absent : property->bytes.front() != 0;
 }
 
-std::wstring nameOf(const StoredObject& object) {
-    return wideOf(ByteReader(requiredData(object, meta::name)).text());
+std::wstring NameOf(const StoredObject& object) {
+    return WideOf(ByteReader(RequiredData(object, meta::kName)).text());
 }
 
-GUID requiredTarget(const StoredObject& object, std::uint16_t pid) {
+GUID RequiredTarget(const StoredObject& object, std::uint16_t pid) {
     const StoredProperty* property = find(object, pid, StoredForm::WeakReference);
     if (property == nullptr) {
-        throw StoredError(propertyText(pid) + " is missing");
+        throw StoredError(PropertyText(pid) + " is missing");
     }
-    return guidOf(property->keys.front());
+    return GuidOf(property->keys.front());
 }
 
 // Names one after the other, each with its terminator. Absent: none.
@@ -68,11 +68,11 @@ std::vector<std::wstring> names(const StoredObject& object, std::uint16_t pid) {
             name += unit;
             continue;
         }
-        out.push_back(wideOf(name));
+        out.push_back(WideOf(name));
         name.clear();
     }
     if (!name.empty()) {
-        throw StoredError(propertyText(pid) + " ends within a name");
+        throw StoredError(PropertyText(pid) + " ends within a name");
     }
     return out;
 }
@@ -85,7 +85,7 @@ std::vector<GUID> ids(const StoredObject& object, std::uint16_t pid) {
     }
     ByteReader from(property->bytes);
     while (from.left() != 0) {
-        out.push_back(guidOf(from.bytes(sizeof(StoredAuid))));
+        out.push_back(GuidOf(from.bytes(sizeof(StoredAuid))));
     }
     return out;
 }
@@ -102,7 +102,7 @@ std::vector<TypeMember> named(std::vector<std::wstring> memberNames, std::size_t
     return members;
 }
 
-std::vector<TypeMember> withIds(std::vector<std::wstring> memberNames,
+std::vector<TypeMember> WithIds(std::vector<std::wstring> memberNames,
                                 const std::vector<GUID>& values) {
     std::vector<TypeMember> members = named(std::move(memberNames), values.size());
     for (std::size_t i = 0; i < values.size(); ++i) {
@@ -111,10 +111,10 @@ std::vector<TypeMember> withIds(std::vector<std::wstring> memberNames,
     return members;
 }
 
-std::vector<TypeMember> enumerationMembers(const StoredObject& object) {
-    std::vector<std::wstring> memberNames = names(object, meta::enumerationNames);
+std::vector<TypeMember> EnumerationMembers(const StoredObject& object) {
+    std::vector<std::wstring> memberNames = names(object, meta::kEnumerationNames);
     std::vector<std::int64_t> values;
-    if (const StoredProperty* stored = find(object, meta::enumerationValues, StoredForm::Data)) {
+    if (const StoredProperty* stored = find(object, meta::kEnumerationValues, StoredForm::Data)) {
         ByteReader from(stored->bytes);
         while (from.left() != 0) {
             values.push_back(from.number<std::int64_t>());
@@ -127,98 +127,98 @@ std::vector<TypeMember> enumerationMembers(const StoredObject& object) {
     return members;
 }
 
-std::vector<TypeMember> recordMembers(const StoredObject& object) {
+std::vector<TypeMember> RecordMembers(const StoredObject& object) {
     std::vector<GUID> types;
     if (const StoredProperty* stored =
-            find(object, meta::recordMemberTypes, StoredForm::WeakVector)) {
+            find(object, meta::kRecordMemberTypes, StoredForm::WeakVector)) {
         for (const Bytes& key : stored->keys) {
-            types.push_back(guidOf(key));
+            types.push_back(GuidOf(key));
         }
     }
-    return withIds(names(object, meta::recordMemberNames), types);
+    return WithIds(names(object, meta::kRecordMemberNames), types);
 }
 
-void readMembers(const StoredObject& object, TypeFacts& record) {
+void ReadMembers(const StoredObject& object, TypeFacts& record) {
     switch (record.kind) {
         case TypeKind::Integer:
-            record.size = requiredNumber<std::uint8_t>(object, meta::integerSize);
-            record.isSigned = flag(object, meta::integerIsSigned, false);
+            record.size = RequiredNumber<std::uint8_t>(object, meta::kIntegerSize);
+            record.isSigned = flag(object, meta::kIntegerIsSigned, false);
             break;
         case TypeKind::WeakReference: {
-            const std::vector<GUID> path = ids(object, meta::weakTargetSet);
-            record.members = withIds(std::vector<std::wstring>(path.size()), path);
+            const std::vector<GUID> path = ids(object, meta::kWeakTargetSet);
+            record.members = WithIds(std::vector<std::wstring>(path.size()), path);
             break;
         }
         case TypeKind::Enumeration:
-            record.members = enumerationMembers(object);
+            record.members = EnumerationMembers(object);
             break;
         case TypeKind::FixedArray:
-            record.size = requiredNumber<std::uint32_t>(object, meta::fixedArrayCount);
+            record.size = RequiredNumber<std::uint32_t>(object, meta::kFixedArrayCount);
             break;
         case TypeKind::Record:
-            record.members = recordMembers(object);
+            record.members = RecordMembers(object);
             break;
         case TypeKind::ExtendibleEnumeration:
-            record.members =
-                withIds(names(object, meta::extendibleNames), ids(object, meta::extendibleValues));
+            record.members = WithIds(names(object, meta::kExtendibleNames),
+                                     ids(object, meta::kExtendibleValues));
             break;
         default:
             break;
     }
 }
 
-MetaProperty readProperty(const StoredObject& object) {
+MetaProperty ReadProperty(const StoredObject& object) {
     MetaProperty record;
-    record.id = guidOf(requiredData(object, meta::identification));
-    record.name = nameOf(object);
-    record.type = guidOf(requiredData(object, meta::propertyType));
-    record.optional = flag(object, meta::isOptional, true);
-    record.pid = requiredNumber<std::uint16_t>(object, meta::localIdentification);
-    record.unique = flag(object, meta::isUniqueIdentifier, false);
+    record.id = GuidOf(RequiredData(object, meta::kIdentification));
+    record.name = NameOf(object);
+    record.type = GuidOf(RequiredData(object, meta::kPropertyType));
+    record.optional = flag(object, meta::kIsOptional, true);
+    record.pid = RequiredNumber<std::uint16_t>(object, meta::kLocalIdentification);
+    record.unique = flag(object, meta::kIsUniqueIdentifier, false);
     return record;
 }
 
-MetaClass readClass(const StoredObject& object) {
+MetaClass ReadClass(const StoredObject& object) {
     MetaClass record;
-    record.id = guidOf(requiredData(object, meta::identification));
-    record.name = nameOf(object);
-    record.parent = requiredTarget(object, meta::parentClass);
-    record.concrete = flag(object, meta::isConcrete, true);
-    if (const StoredProperty* set = find(object, meta::properties, StoredForm::StrongSet)) {
+    record.id = GuidOf(RequiredData(object, meta::kIdentification));
+    record.name = NameOf(object);
+    record.parent = RequiredTarget(object, meta::kParentClass);
+    record.concrete = flag(object, meta::kIsConcrete, true);
+    if (const StoredProperty* set = find(object, meta::kProperties, StoredForm::StrongSet)) {
         for (const StoredObject& property : set->objects) {
-            record.properties.push_back(readProperty(property));
+            record.properties.push_back(ReadProperty(property));
         }
     }
     return record;
 }
 
-TypeFacts readType(const StoredObject& object, TypeKind kind) {
+TypeFacts ReadType(const StoredObject& object, TypeKind kind) {
     TypeFacts record;
-    record.id = guidOf(requiredData(object, meta::identification));
-    record.name = nameOf(object);
+    record.id = GuidOf(RequiredData(object, meta::kIdentification));
+    record.name = NameOf(object);
     record.kind = kind;
-    if (const std::uint16_t pid = targetPidOf(kind); pid != 0) {
-        record.target = requiredTarget(object, pid);
+    if (const std::uint16_t pid = TargetPidOf(kind); pid != 0) {
+        record.target = RequiredTarget(object, pid);
     }
-    readMembers(object, record);
+    ReadMembers(object, record);
     return record;
 }
 
 }  // namespace
 
-MetaRecords readMetaDictionary(const StoredObject& metaDictionary) {
+MetaRecords ReadMetaDictionary(const StoredObject& metaDictionary) {
     MetaRecords records;
     try {
         for (const StoredObject& object :
-             requiredSet(metaDictionary, meta::classDefinitions).objects) {
-            if (guidOf(object.classId) == AUID_AAFClassDef) {
-                records.classes.push_back(readClass(object));
+             RequiredSet(metaDictionary, meta::kClassDefinitions).objects) {
+            if (GuidOf(object.classId) == AUID_AAFClassDef) {
+                records.classes.push_back(ReadClass(object));
             }
         }
         for (const StoredObject& object :
-             requiredSet(metaDictionary, meta::typeDefinitions).objects) {
-            if (TypeKind kind{}; IsClassOfTypes(guidOf(object.classId), &kind)) {
-                records.types.push_back(readType(object, kind));
+             RequiredSet(metaDictionary, meta::kTypeDefinitions).objects) {
+            if (TypeKind kind{}; IsClassOfTypes(GuidOf(object.classId), &kind)) {
+                records.types.push_back(ReadType(object, kind));
             }
         }
     } catch (const StoredError& problem) {

@@ -9,20 +9,20 @@ namespace aaf::stored {
 
 namespace {
 
-const std::vector<std::uint16_t> classPath = {meta::rootMetaDictionary, meta::classDefinitions};
-const std::vector<std::uint16_t> typePath = {meta::rootMetaDictionary, meta::typeDefinitions};
+const std::vector<std::uint16_t> kClassPath = {meta::kRootMetaDictionary, meta::kClassDefinitions};
+const std::vector<std::uint16_t> kTypePath = {meta::kRootMetaDictionary, meta::kTypeDefinitions};
 
-Bytes idBytes(const GUID& id) {
-    const StoredAuid stored = storedAuid(id);
+Bytes IdBytes(const GUID& id) {
+    const StoredAuid stored = AuidOf(id);
     return Bytes(stored.begin(), stored.end());
 }
 
 class Definition {
 public:
     Definition(const GUID& definitionClass, const GUID& id, const std::wstring& name) {
-        object_.classId = storedAuid(definitionClass);
-        data(meta::identification, idBytes(id));
-        data(meta::name, ByteWriter().text(utf16Of(name)).bytes());
+        object_.classId = AuidOf(definitionClass);
+        data(meta::kIdentification, IdBytes(id));
+        data(meta::kName, ByteWriter().text(Utf16Of(name)).bytes());
     }
 
     void data(std::uint16_t pid, Bytes value) {
@@ -44,78 +44,78 @@ public:
         property.form = form;
         property.name = name;
         property.keys = std::move(keys);
-        property.keyPid = meta::identification;
+        property.keyPid = meta::kIdentification;
         property.targetPath = path;
         object_.properties.push_back(std::move(property));
     }
     void weak(std::uint16_t pid, const GUID& target, const std::vector<std::uint16_t>& path) {
-        weak(pid, StoredForm::WeakReference, {}, {idBytes(target)}, path);
+        weak(pid, StoredForm::WeakReference, {}, {IdBytes(target)}, path);
     }
 
     void set(StoredProperty property) { object_.properties.push_back(std::move(property)); }
 
-    StoredObject take() { return std::move(object_); }
+    StoredObject Take() { return std::move(object_); }
 
 private:
     StoredObject object_;
 };
 
-StoredProperty definitionSet(std::uint16_t pid, const std::u16string& name) {
+StoredProperty DefinitionSet(std::uint16_t pid, const std::u16string& name) {
     StoredProperty set;
     set.pid = pid;
     set.form = StoredForm::StrongSet;
     set.name = name;
-    set.keyPid = meta::identification;
+    set.keyPid = meta::kIdentification;
     return set;
 }
 
-void addTo(StoredProperty& set, const GUID& id, StoredObject definition) {
-    set.keys.push_back(idBytes(id));
+void AddTo(StoredProperty& set, const GUID& id, StoredObject definition) {
+    set.keys.push_back(IdBytes(id));
     set.objects.push_back(std::move(definition));
 }
 
-StoredObject storedProperty(const MetaProperty& record) {
+StoredObject StoredPropertyDefinition(const MetaProperty& record) {
     Definition definition(AUID_AAFPropertyDef, record.id, record.name);
-    definition.data(meta::propertyType, idBytes(record.type));  // an id, no weak reference
-    definition.flag(meta::isOptional, record.optional);
-    definition.number(meta::localIdentification, record.pid);
+    definition.data(meta::kPropertyType, IdBytes(record.type));  // an id, no weak reference
+    definition.flag(meta::kIsOptional, record.optional);
+    definition.number(meta::kLocalIdentification, record.pid);
     if (record.unique) {
-        definition.flag(meta::isUniqueIdentifier, true);
+        definition.flag(meta::kIsUniqueIdentifier, true);
     }
-    return definition.take();
+    return definition.Take();
 }
 
-StoredObject storedClass(const MetaClass& record) {
+StoredObject StoredClass(const MetaClass& record) {
     Definition definition(AUID_AAFClassDef, record.id, record.name);
-    definition.weak(meta::parentClass, record.parent, classPath);
+    definition.weak(meta::kParentClass, record.parent, kClassPath);
     if (!record.properties.empty()) {
-        StoredProperty properties = definitionSet(meta::properties, u"Properties");
+        StoredProperty properties = DefinitionSet(meta::kProperties, u"Properties");
         for (const MetaProperty& property : record.properties) {
-            addTo(properties, property.id, storedProperty(property));
+            AddTo(properties, property.id, StoredPropertyDefinition(property));
         }
         definition.set(std::move(properties));
     }
-    definition.flag(meta::isConcrete, record.concrete);
-    return definition.take();
+    definition.flag(meta::kIsConcrete, record.concrete);
+    return definition.Take();
 }
 
-Bytes memberNames(const TypeFacts& record) {
+Bytes MemberNames(const TypeFacts& record) {
     ByteWriter names;
     for (const TypeMember& member : record.members) {
-        names.text(utf16Of(member.name));
+        names.text(Utf16Of(member.name));
     }
     return names.bytes();
 }
 
-Bytes memberIds(const TypeFacts& record) {
+Bytes MemberIds(const TypeFacts& record) {
     ByteWriter ids;
     for (const TypeMember& member : record.members) {
-        ids.append(storedAuid(member.id));
+        ids.Append(AuidOf(member.id));
     }
     return ids.bytes();
 }
 
-Bytes memberValues(const TypeFacts& record) {
+Bytes MemberValues(const TypeFacts& record) {
     ByteWriter values;
     for (const TypeMember& member : record.members) {
         values.number(member.value);
@@ -123,62 +123,62 @@ Bytes memberValues(const TypeFacts& record) {
     return values.bytes();
 }
 
-void addRecordMembers(Definition& definition, const TypeFacts& record) {
+void AddRecordMembers(Definition& definition, const TypeFacts& record) {
     std::vector<Bytes> types;
     for (const TypeMember& member : record.members) {
-        types.push_back(idBytes(member.id));
+        types.push_back(IdBytes(member.id));
     }
-    definition.weak(meta::recordMemberTypes, StoredForm::WeakVector, u"MemberTypes",
-                    std::move(types), typePath);
-    definition.data(meta::recordMemberNames, memberNames(record));
+    definition.weak(meta::kRecordMemberTypes, StoredForm::WeakVector, u"MemberTypes",
+                    std::move(types), kTypePath);
+    definition.data(meta::kRecordMemberNames, MemberNames(record));
 }
 
-StoredObject storedType(const TypeFacts& record) {
+StoredObject StoredType(const TypeFacts& record) {
     Definition definition(ClassOfTypes(record.kind), record.id, record.name);
-    if (const std::uint16_t pid = targetPidOf(record.kind); pid != 0) {
-        definition.weak(pid, record.target, RefersToClass(record.kind) ? classPath : typePath);
+    if (const std::uint16_t pid = TargetPidOf(record.kind); pid != 0) {
+        definition.weak(pid, record.target, RefersToClass(record.kind) ? kClassPath : kTypePath);
     }
     switch (record.kind) {
         case TypeKind::Integer:
-            definition.number(meta::integerSize, static_cast<std::uint8_t>(record.size));
-            definition.flag(meta::integerIsSigned, record.isSigned);
+            definition.number(meta::kIntegerSize, static_cast<std::uint8_t>(record.size));
+            definition.flag(meta::kIntegerIsSigned, record.isSigned);
             break;
         case TypeKind::WeakReference:
-            definition.data(meta::weakTargetSet, memberIds(record));
+            definition.data(meta::kWeakTargetSet, MemberIds(record));
             break;
         case TypeKind::Enumeration:
-            definition.data(meta::enumerationNames, memberNames(record));
-            definition.data(meta::enumerationValues, memberValues(record));
+            definition.data(meta::kEnumerationNames, MemberNames(record));
+            definition.data(meta::kEnumerationValues, MemberValues(record));
             break;
         case TypeKind::FixedArray:
-            definition.number(meta::fixedArrayCount, record.size);
+            definition.number(meta::kFixedArrayCount, record.size);
             break;
         case TypeKind::Record:
-            addRecordMembers(definition, record);
+            AddRecordMembers(definition, record);
             break;
         case TypeKind::ExtendibleEnumeration:
-            definition.data(meta::extendibleNames, memberNames(record));
-            definition.data(meta::extendibleValues, memberIds(record));
+            definition.data(meta::kExtendibleNames, MemberNames(record));
+            definition.data(meta::kExtendibleValues, MemberIds(record));
             break;
         default:
             break;  // the others are told by their target alone
     }
-    return definition.take();
+    return definition.Take();
 }
 
 }  // namespace
 
-StoredObject storedMetaDictionary(const MetaRecords& records) {
-    StoredProperty classes = definitionSet(meta::classDefinitions, u"ClassDefinitions");
+StoredObject StoredMetaDictionary(const MetaRecords& records) {
+    StoredProperty classes = DefinitionSet(meta::kClassDefinitions, u"ClassDefinitions");
     for (const MetaClass& record : records.classes) {
-        addTo(classes, record.id, storedClass(record));
+        AddTo(classes, record.id, StoredClass(record));
     }
-    StoredProperty types = definitionSet(meta::typeDefinitions, u"TypeDefinitions");
+    StoredProperty types = DefinitionSet(meta::kTypeDefinitions, u"TypeDefinitions");
     for (const TypeFacts& record : records.types) {
-        addTo(types, record.id, storedType(record));
+        AddTo(types, record.id, StoredType(record));
     }
     StoredObject dictionary;
-    dictionary.classId = storedAuid(AUID_AAFMetaDictionary);
+    dictionary.classId = AuidOf(AUID_AAFMetaDictionary);
     dictionary.properties.push_back(std::move(classes));
     dictionary.properties.push_back(std::move(types));
     return dictionary;

@@ -11,6 +11,6 @@
 namespace aaf::stored {
 
 // The weak reference of a type's definition to the type or class it is made of, or 0.
-std::uint16_t targetPidOf(TypeKind kind);
+std::uint16_t TargetPidOf(TypeKind kind);
 
 }  // namespace aaf::stored

@@ -9,30 +9,30 @@
 
 namespace aaf::stored {
 
-std::uint16_t targetPidOf(TypeKind kind) {
+std::uint16_t TargetPidOf(TypeKind kind) {
     switch (kind) {
         case TypeKind::StrongReference:
-            return meta::strongReferencedType;
+            return meta::kStrongReferencedType;
         case TypeKind::WeakReference:
-            return meta::weakReferencedType;
+            return meta::kWeakReferencedType;
         case TypeKind::Enumeration:
-            return meta::enumerationElementType;
+            return meta::kEnumerationElementType;
         case TypeKind::FixedArray:
-            return meta::fixedArrayElementType;
+            return meta::kFixedArrayElementType;
         case TypeKind::VariableArray:
-            return meta::variableArrayElementType;
+            return meta::kVariableArrayElementType;
         case TypeKind::Set:
-            return meta::setElementType;
+            return meta::kSetElementType;
         case TypeKind::String:
-            return meta::stringElementType;
+            return meta::kStringElementType;
         case TypeKind::Rename:
-            return meta::renamedType;
+            return meta::kRenamedType;
         default:
             return 0;
     }
 }
 
-StoredAuid storedAuid(const GUID& id) {
+StoredAuid AuidOf(const GUID& id) {
     const Bytes bytes = ByteWriter()
                             .number(static_cast<std::uint32_t>(id.Data1))
                             .number(static_cast<std::uint16_t>(id.Data2))
@@ -44,7 +44,7 @@ StoredAuid storedAuid(const GUID& id) {
     return out;
 }
 
-GUID guidOf(const StoredAuid& id) {
+GUID GuidOf(const StoredAuid& id) {
     ByteReader from(id.data(), id.size());
     GUID out{};
     out.Data1 = from.number<std::uint32_t>();
@@ -54,13 +54,13 @@ GUID guidOf(const StoredAuid& id) {
     return out;
 }
 
-GUID guidOf(const Bytes& bytes) {
+GUID GuidOf(const Bytes& bytes) {
     StoredAuid id;
     if (bytes.size() != id.size()) {
         throw StoredError("an id of " + std::to_string(bytes.size()) + " bytes");
     }
     std::copy(bytes.begin(), bytes.end(), id.begin());
-    return guidOf(id);
+    return GuidOf(id);
 }
 
 }  // namespace aaf::stored

@@ -38,13 +38,13 @@ struct MetaRecords {
 };
 
 // The object that the root holds as its MetaDictionary.
-StoredObject storedMetaDictionary(const MetaRecords& records);
+StoredObject StoredMetaDictionary(const MetaRecords& records);
 
 // Definitions of a kind that nobody knows are passed over. Throws StoredError.
-MetaRecords readMetaDictionary(const StoredObject& metaDictionary);
+MetaRecords ReadMetaDictionary(const StoredObject& metaDictionary);
 
-StoredAuid storedAuid(const GUID& id);
-GUID guidOf(const StoredAuid& id);
-GUID guidOf(const Bytes& bytes);  // throws StoredError unless there are 16
+StoredAuid AuidOf(const GUID& id);
+GUID GuidOf(const StoredAuid& id);
+GUID GuidOf(const Bytes& bytes);  // throws StoredError unless there are 16
 
 }  // namespace aaf::stored

@@ -19,14 +19,14 @@ namespace {
 
 // Longest line of parents, and of types made of one another. Definitions are
 // followed by recursion all over the model.
-constexpr int longestLine = 64;
+constexpr int kLongestLine = 64;
 
 // Numbers that one model can give to properties of its own are limited; this
 // leaves plenty for callers.
-constexpr std::size_t mostNewProperties = 16384;
+constexpr std::size_t kMostNewProperties = 16384;
 
-void checkLine(int depth) {
-    if (depth > longestLine) {
+void CheckLine(int depth) {
+    if (depth > kLongestLine) {
         throw StoredError("definitions that are made of one another without end");
     }
 }
@@ -44,12 +44,12 @@ MetaRegistration::MetaRegistration(const MetaRecords& records, Model& model) : m
         types_.emplace(record.id, &record);
     }
     for (const MetaClass& record : records.classes) {
-        enterClass(record.id, 0);
+        EnterClass(record.id, 0);
     }
     for (const TypeFacts& record : records.types) {
-        enterType(record.id, 0);
+        EnterType(record.id, 0);
     }
-    enterProperties();
+    EnterProperties();
 }
 
 PropertyDefinition* MetaRegistration::property(ClassDefinition& definition,
@@ -65,13 +65,13 @@ PropertyDefinition* MetaRegistration::property(ClassDefinition& definition,
         }
     }
     // Files may leave out what every reader knows.
-    return pid < firstLocalPid ? definition.FindProperty(PropertyId{pid}) : nullptr;
+    return pid < kFirstLocalPid ? definition.FindProperty(PropertyId{pid}) : nullptr;
 }
 
 // Parents first. A class whose line of parents is broken is left out, and with
 // it the objects that would need it are refused.
-ClassDefinition* MetaRegistration::enterClass(const GUID& id, int depth) {
-    checkLine(depth);
+ClassDefinition* MetaRegistration::EnterClass(const GUID& id, int depth) {
+    CheckLine(depth);
     if (ClassDefinition* known = model_.FindClass(id)) {
         return known;
     }
@@ -82,7 +82,7 @@ ClassDefinition* MetaRegistration::enterClass(const GUID& id, int depth) {
     const MetaClass& record = *found->second;
     ClassDefinition* parent = nullptr;
     if (record.parent != id) {
-        parent = enterClass(record.parent, depth + 1);
+        parent = EnterClass(record.parent, depth + 1);
         if (parent == nullptr) {
             return nullptr;
         }
@@ -95,8 +95,8 @@ ClassDefinition* MetaRegistration::enterClass(const GUID& id, int depth) {
     return model_.RegisterClass(*definition) < 0 ? nullptr : model_.FindClass(id);
 }
 
-TypeDefinition* MetaRegistration::enterType(const GUID& id, int depth) {
-    checkLine(depth);
+TypeDefinition* MetaRegistration::EnterType(const GUID& id, int depth) {
+    CheckLine(depth);
     if (TypeDefinition* known = model_.FindType(id)) {
         return known;
     }
@@ -104,25 +104,25 @@ TypeDefinition* MetaRegistration::enterType(const GUID& id, int depth) {
     if (found == types_.end() || !begun_.insert(id).second) {
         return nullptr;
     }
-    return makeType(*found->second, depth);
+    return MakeType(*found->second, depth);
 }
 
-TypeDefinition* MetaRegistration::makeType(const TypeFacts& record, int depth) {
+TypeDefinition* MetaRegistration::MakeType(const TypeFacts& record, int depth) {
     if (RefersToClass(record.kind)) {
         if (model_.FindClass(record.target) == nullptr) {
             return nullptr;
         }
-    } else if (targetPidOf(record.kind) != 0 && enterType(record.target, depth + 1) == nullptr) {
+    } else if (TargetPidOf(record.kind) != 0 && EnterType(record.target, depth + 1) == nullptr) {
         return nullptr;
     }
     if (record.kind == TypeKind::Record) {
         for (const TypeMember& member : record.members) {
-            if (enterType(member.id, depth + 1) == nullptr) {
+            if (EnterType(member.id, depth + 1) == nullptr) {
                 return nullptr;
             }
         }
     }
-    const RefPtr<TypeDefinition> type = typeOf(record, model_);
+    const RefPtr<TypeDefinition> type = StorableType(record, model_);
     if (!type || model_.RegisterType(*type) < 0) {
         return nullptr;
     }
@@ -131,7 +131,7 @@ TypeDefinition* MetaRegistration::makeType(const TypeFacts& record, int depth) {
 
 // In the order of the file's numbers, which go downwards: so a file that is
 // read and written again keeps them.
-void MetaRegistration::enterProperties() {
+void MetaRegistration::EnterProperties() {
     std::vector<std::pair<const MetaClass*, const MetaProperty*>> added;
     for (const auto& entry : classes_) {
         for (const MetaProperty& property : entry.second->properties) {
@@ -142,12 +142,12 @@ void MetaRegistration::enterProperties() {
             }
         }
     }
-    if (added.size() > mostNewProperties) {
+    if (added.size() > kMostNewProperties) {
         throw StoredError("more properties than can be numbered");
     }
     std::sort(added.begin(), added.end(), [](const auto& a, const auto& b) {
-        return std::make_pair(b.second->pid, storedAuid(a.second->id)) <
-               std::make_pair(a.second->pid, storedAuid(b.second->id));
+        return std::make_pair(b.second->pid, AuidOf(a.second->id)) <
+               std::make_pair(a.second->pid, AuidOf(b.second->id));
     });
     for (const auto& [owner, property] : added) {
         if (model_.FindProperty(property->id) == nullptr) {

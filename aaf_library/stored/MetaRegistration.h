@@ -31,10 +31,10 @@ public:
     PropertyDefinition* property(ClassDefinition& definition, std::uint16_t pid) const;
 
 private:
-    ClassDefinition* enterClass(const GUID& id, int depth);
-    TypeDefinition* enterType(const GUID& id, int depth);
-    TypeDefinition* makeType(const TypeFacts& record, int depth);
-    void enterProperties();
+    ClassDefinition* EnterClass(const GUID& id, int depth);
+    TypeDefinition* EnterType(const GUID& id, int depth);
+    TypeDefinition* MakeType(const TypeFacts& record, int depth);
+    void EnterProperties();
 
     Model& model_;
     std::unordered_map<GUID, const MetaClass*, GuidHash> classes_;

@@ -11,10 +11,10 @@
 
 namespace aaf::stored {
 
-FileResult saveModel(Model& model, Object& header, const std::filesystem::path& path,
+FileResult SaveModel(Model& model, Object& header, const std::filesystem::path& path,
                      SectorSize sectorSize) {
     try {
-        return saveTree(treeOfModel(model, header), path, sectorSize);
+        return SaveTree(TreeOfModel(model, header), path, sectorSize);
     } catch (const StoredError& problem) {
         return {FileFailure::NotStorable, path.u8string() + ": " + problem.what()};
     } catch (const std::bad_alloc&) {
@@ -22,14 +22,14 @@ FileResult saveModel(Model& model, Object& header, const std::filesystem::path& 
     }
 }
 
-FileResult loadModel(const std::filesystem::path& path, Model& model, RefPtr<Object>& header) {
+FileResult LoadModel(const std::filesystem::path& path, Model& model, RefPtr<Object>& header) {
     header = nullptr;
     StoredObject root;
-    if (FileResult result = loadTree(path, root); !result) {
+    if (FileResult result = LoadTree(path, root); !result) {
         return result;
     }
     try {
-        header = readModel(root, model);
+        header = ReadModel(root, model);
         return {};
     } catch (const StoredError& problem) {
         return {FileFailure::Damaged, path.u8string() + ": " + problem.what()};

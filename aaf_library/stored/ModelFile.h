@@ -17,12 +17,12 @@ namespace aaf::stored {
 // Writes the header with all that it contains, the model's dictionary and the
 // definitions that these need. See ModelWriter.h for what is added and
 // StoredFile.h for how the file is replaced.
-FileResult saveModel(Model& model, Object& header, const std::filesystem::path& path,
+FileResult SaveModel(Model& model, Object& header, const std::filesystem::path& path,
                      SectorSize sectorSize);
 
 // Reads into a new model. The header comes back free; its dictionary is
 // model.dictionary(). On failure the model has to be thrown away and the
 // header is null.
-FileResult loadModel(const std::filesystem::path& path, Model& model, RefPtr<Object>& header);
+FileResult LoadModel(const std::filesystem::path& path, Model& model, RefPtr<Object>& header);
 
 }  // namespace aaf::stored

@@ -8,7 +8,7 @@
 
 namespace aaf::stored {
 
-std::u16string utf16Of(const std::wstring& text) {
+std::u16string Utf16Of(const std::wstring& text) {
     Bytes stored;
     AppendUtf16(text.data(), text.size(), stored);
     ByteReader from(stored);
@@ -19,7 +19,7 @@ std::u16string utf16Of(const std::wstring& text) {
     return out;
 }
 
-std::wstring wideOf(const std::u16string& text) {
+std::wstring WideOf(const std::u16string& text) {
     ByteWriter stored;
     for (char16_t unit : text) {
         stored.number(static_cast<std::uint16_t>(unit));
@@ -27,11 +27,11 @@ std::wstring wideOf(const std::u16string& text) {
     return FromUtf16(stored.bytes().data(), stored.bytes().size());
 }
 
-std::string toUtf8(const std::wstring& text) {
-    return toUtf8(utf16Of(text));
+std::string ToUtf8(const std::wstring& text) {
+    return ToUtf8(Utf16Of(text));
 }
 
-StoredForm storedFormOf(const TypeDefinition& type) {
+StoredForm StoredFormOf(const TypeDefinition& type) {
     switch (type.form()) {
         case ValueForm::Stream:
             return StoredForm::Stream;
@@ -53,7 +53,7 @@ StoredForm storedFormOf(const TypeDefinition& type) {
     return StoredForm::Data;
 }
 
-const TypeDefinition& referenceIn(const TypeDefinition& type) {
+const TypeDefinition& ReferenceIn(const TypeDefinition& type) {
     const TypeDefinition& plain = type.Resolved();
     const bool isCollection =
         plain.kind() == TypeKind::VariableArray || plain.kind() == TypeKind::Set;

@@ -15,21 +15,21 @@ class TypeDefinition;
 
 namespace aaf::stored {
 
-std::u16string utf16Of(const std::wstring& text);
-std::wstring wideOf(const std::u16string& text);
+std::u16string Utf16Of(const std::wstring& text);
+std::wstring WideOf(const std::u16string& text);
 // For messages, as toUtf8 of StoredNames.h.
-std::string toUtf8(const std::wstring& text);
+std::string ToUtf8(const std::wstring& text);
 
 // Form in which a property of that type is stored.
-StoredForm storedFormOf(const TypeDefinition& type);
+StoredForm StoredFormOf(const TypeDefinition& type);
 
 // The reference type behind a reference, or behind the elements of a
 // collection of references.
-const TypeDefinition& referenceIn(const TypeDefinition& type);
+const TypeDefinition& ReferenceIn(const TypeDefinition& type);
 
 // Ids of the root's two properties, with which every path of a weak reference
 // begins. The root's class stands in no dictionary.
-inline constexpr GUID rootMetaDictionaryId = ncfGuid("0D010301-0101-0100-060E-2B3401010102");
-inline constexpr GUID rootHeaderId = ncfGuid("0D010301-0102-0100-060E-2B3401010102");
+inline constexpr GUID kRootMetaDictionaryId = ncfGuid("0D010301-0101-0100-060E-2B3401010102");
+inline constexpr GUID kRootHeaderId = ncfGuid("0D010301-0102-0100-060E-2B3401010102");
 
 }  // namespace aaf::stored

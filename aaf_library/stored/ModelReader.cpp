@@ -19,7 +19,7 @@ namespace aaf::stored {
 namespace {
 
 const StoredObject& contained(const StoredObject& holder, std::uint16_t pid, const char* what) {
-    const StoredProperty* property = holder.find(pid);
+    const StoredProperty* property = holder.Find(pid);
     if (property == nullptr || property->form != StoredForm::StrongReference) {
         throw StoredError(std::string("has no ") + what);
     }
@@ -32,9 +32,9 @@ public:
         : model_(model), definitions_(records, model) {}
 
     RefPtr<Object> header(const StoredObject& from) {
-        mergeDictionary(contained(from, prop::Header_Dictionary.pid, "dictionary"));
-        RefPtr<Object> header = newObject(from, AUID_AAFHeader);
-        fill(*header, from, prop::Header_Dictionary.id);
+        MergeDictionary(contained(from, prop::Header_Dictionary.pid, "dictionary"));
+        RefPtr<Object> header = NewObject(from, AUID_AAFHeader);
+        Fill(*header, from, prop::Header_Dictionary.id);
         header->PutObject(prop::Header_Dictionary, model_.dictionary().Identity());
         if (header->ObjectAt(prop::Header_Content) == nullptr) {
             throw StoredError("has no content");
@@ -45,24 +45,24 @@ public:
 private:
     // An empty object of the class, which has to be of the expected kind: the
     // operations of objects rely on what they find in their properties.
-    RefPtr<Object> newObject(const StoredObject& from, const GUID& expected) {
-        ClassDefinition* definition = model_.FindClass(guidOf(from.classId));
+    RefPtr<Object> NewObject(const StoredObject& from, const GUID& expected) {
+        ClassDefinition* definition = model_.FindClass(GuidOf(from.classId));
         if (definition == nullptr || !definition->IsKindOf(AUID_AAFInterchangeObject)) {
             throw StoredError("an object of a class that is not defined");
         }
         if (!definition->IsKindOf(expected)) {
-            throw StoredError("an object of the class " + toUtf8(definition->name()) +
+            throw StoredError("an object of the class " + ToUtf8(definition->name()) +
                               " in a place for others");
         }
         RefPtr<Object> object = model_.CreateObject(*definition, false);
         if (!object) {
-            throw StoredError("an object of the class " + toUtf8(definition->name()) +
+            throw StoredError("an object of the class " + ToUtf8(definition->name()) +
                               " cannot be made");
         }
         return object;
     }
 
-    void fill(Object& object, const StoredObject& from, const GUID& leftOut = {}) {
+    void Fill(Object& object, const StoredObject& from, const GUID& leftOut = {}) {
         for (const StoredProperty& property : from.properties) {
             PropertyDefinition* definition =
                 definitions_.property(object.classDefinition(), property.pid);
@@ -72,22 +72,22 @@ private:
                 continue;
             }
             try {
-                const RefPtr<PropertyValue> value = valueOf(*definition->type(), property);
+                const RefPtr<PropertyValue> value = ValueOf(*definition->type(), property);
                 if (object.PutValue(definition->pid(), value.get()) < 0) {
                     throw StoredError("an object cannot hold it");
                 }
             } catch (const StoredError& problem) {
-                throw StoredError(toUtf8(definition->name()) + ": " + problem.what());
+                throw StoredError(ToUtf8(definition->name()) + ": " + problem.what());
             }
         }
     }
 
-    RefPtr<PropertyValue> valueOf(TypeDefinition& type, const StoredProperty& from) {
-        if (storedFormOf(type) != from.form) {
+    RefPtr<PropertyValue> ValueOf(TypeDefinition& type, const StoredProperty& from) {
+        if (StoredFormOf(type) != from.form) {
             throw StoredError("is stored in another form than its type has");
         }
         if (from.form == StoredForm::Data) {
-            checkSize(type, from.bytes.size());
+            CheckSize(type, from.bytes.size());
         }
         RefPtr<PropertyValue> value = model_.NewValue(type);
         switch (from.form) {
@@ -103,13 +103,13 @@ private:
             case StoredForm::StrongReference:
             case StoredForm::StrongVector:
             case StoredForm::StrongSet:
-                addObjects(*value, type, from);
+                AddObjects(*value, type, from);
                 break;
         }
         return value;
     }
 
-    static void checkSize(const TypeDefinition& type, std::size_t size) {
+    static void CheckSize(const TypeDefinition& type, std::size_t size) {
         const TypeDefinition& plain = type.Resolved();
         const bool isList =
             plain.kind() == TypeKind::VariableArray || plain.kind() == TypeKind::Set;
@@ -135,11 +135,11 @@ private:
         return ids;
     }
 
-    void addObjects(PropertyValue& value, const TypeDefinition& type, const StoredProperty& from) {
-        const GUID expected = FactsOf(referenceIn(type)).target;
+    void AddObjects(PropertyValue& value, const TypeDefinition& type, const StoredProperty& from) {
+        const GUID expected = FactsOf(ReferenceIn(type)).target;
         for (std::size_t i = 0; i < from.objects.size(); ++i) {
-            const RefPtr<Object> object = newObject(from.objects[i], expected);
-            fill(*object, from.objects[i]);
+            const RefPtr<Object> object = NewObject(from.objects[i], expected);
+            Fill(*object, from.objects[i]);
             if (from.form == StoredForm::StrongSet && object->UniqueKey() != from.keys[i]) {
                 throw StoredError("an element whose key differs from that in the index");
             }
@@ -154,7 +154,7 @@ private:
 
     // The model has a dictionary with the built-in definitions. Those of the
     // file that are known get what the file says of them, others are added.
-    void mergeDictionary(const StoredObject& from) {
+    void MergeDictionary(const StoredObject& from) {
         Dictionary& dictionary = model_.dictionary();
         StoredObject others;
         for (const StoredProperty& property : from.properties) {
@@ -164,30 +164,30 @@ private:
                 continue;
             }
             if (property.form != StoredForm::StrongSet ||
-                storedFormOf(*definition->type()) != StoredForm::StrongSet) {
+                StoredFormOf(*definition->type()) != StoredForm::StrongSet) {
                 others.properties.push_back(property);
                 continue;
             }
             try {
-                mergeSet(dictionary, *definition, property);
+                MergeSet(dictionary, *definition, property);
             } catch (const StoredError& problem) {
-                throw StoredError(toUtf8(definition->name()) + ": " + problem.what());
+                throw StoredError(ToUtf8(definition->name()) + ": " + problem.what());
             }
         }
-        fill(dictionary, others);
+        Fill(dictionary, others);
     }
 
-    void mergeSet(Dictionary& dictionary, const PropertyDefinition& definition,
+    void MergeSet(Dictionary& dictionary, const PropertyDefinition& definition,
                   const StoredProperty& from) {
-        const GUID expected = FactsOf(referenceIn(*definition.type())).target;
+        const GUID expected = FactsOf(ReferenceIn(*definition.type())).target;
         for (std::size_t i = 0; i < from.objects.size(); ++i) {
             const Bytes& key = from.keys[i];
             Object* known = dictionary.FindInSet(definition.key(), key.data(), key.size());
             RefPtr<Object> object(known);
             if (known == nullptr) {
-                object = newObject(from.objects[i], expected);
+                object = NewObject(from.objects[i], expected);
             }
-            fill(*object, from.objects[i]);
+            Fill(*object, from.objects[i]);
             if (object->UniqueKey() != key) {
                 throw StoredError("an element whose key differs from that in the index");
             }
@@ -203,10 +203,10 @@ private:
 
 }  // namespace
 
-RefPtr<Object> readModel(const StoredObject& root, Model& model) {
+RefPtr<Object> ReadModel(const StoredObject& root, Model& model) {
     const MetaRecords records =
-        readMetaDictionary(contained(root, meta::rootMetaDictionary, "meta-dictionary"));
-    const StoredObject& header = contained(root, meta::rootHeader, "header");
+        ReadMetaDictionary(contained(root, meta::kRootMetaDictionary, "meta-dictionary"));
+    const StoredObject& header = contained(root, meta::kRootHeader, "header");
     ModelReader reader(records, model);
     return reader.header(header);
 }

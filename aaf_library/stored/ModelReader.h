@@ -18,6 +18,6 @@ namespace aaf::stored {
 // the model's. Properties are told by their ids, so the file's own
 // numbers do not matter. Values that nothing describes are passed over.
 // Throws StoredError; the model then is of no further use.
-RefPtr<Object> readModel(const StoredObject& root, Model& model);
+RefPtr<Object> ReadModel(const StoredObject& root, Model& model);
 
 }  // namespace aaf::stored

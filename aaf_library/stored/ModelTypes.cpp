@@ -9,9 +9,9 @@ namespace aaf::stored {
 namespace {
 
 // A property value has a size field of 16 bits.
-constexpr std::uint64_t largestValue = 0xFFFF;
+constexpr std::uint64_t kLargestValue = 0xFFFF;
 
-bool isStorable(const TypeFacts& record, Model& model) {
+bool IsStorable(const TypeFacts& record, Model& model) {
     const TypeDefinition* target = model.FindType(record.target);
     switch (record.kind) {
         case TypeKind::Integer:
@@ -21,7 +21,7 @@ bool isStorable(const TypeFacts& record, Model& model) {
         case TypeKind::FixedArray: {
             const std::uint64_t size =
                 target == nullptr ? 0 : std::uint64_t{record.size} * target->StoredSize();
-            return size != 0 && size <= largestValue;
+            return size != 0 && size <= kLargestValue;
         }
         case TypeKind::Record: {
             std::uint64_t size = 0;
@@ -32,7 +32,7 @@ bool isStorable(const TypeFacts& record, Model& model) {
                 }
                 size += member->StoredSize();
             }
-            return size != 0 && size <= largestValue;
+            return size != 0 && size <= kLargestValue;
         }
         default:
             return true;
@@ -41,8 +41,8 @@ bool isStorable(const TypeFacts& record, Model& model) {
 
 }  // namespace
 
-RefPtr<TypeDefinition> typeOf(const TypeFacts& record, Model& model) {
-    return isStorable(record, model) ? MakeType(model, record) : nullptr;
+RefPtr<TypeDefinition> StorableType(const TypeFacts& record, Model& model) {
+    return IsStorable(record, model) ? MakeType(model, record) : nullptr;
 }
 
 }  // namespace aaf::stored

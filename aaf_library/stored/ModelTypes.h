@@ -13,11 +13,11 @@ class TypeDefinition;
 namespace aaf::stored {
 
 // Pids from here on mean something else in every file.
-inline constexpr std::uint16_t firstLocalPid = 0x8000;
+inline constexpr std::uint16_t kFirstLocalPid = 0x8000;
 
 // A free type made of the record. Everything that it refers to must be in the
 // model. Null when the record makes no sense, such as an integer of 3 bytes or
 // a value that is larger than any that can be stored.
-RefPtr<TypeDefinition> typeOf(const TypeFacts& record, Model& model);
+RefPtr<TypeDefinition> StorableType(const TypeFacts& record, Model& model);
 
 }  // namespace aaf::stored

@@ -25,10 +25,10 @@ namespace {
 
 using Path = std::vector<std::uint16_t>;
 
-constexpr std::size_t idSize = sizeof(StoredAuid);
+constexpr std::size_t kIdSize = sizeof(StoredAuid);
 
-bool isBuiltInDefinition(const Bytes& id) {
-    const GUID wanted = guidOf(id);
+bool IsBuiltInDefinition(const Bytes& id) {
+    const GUID wanted = GuidOf(id);
     for (Span<BuiltInDefinition> table :
          {BuiltInDataDefinitions(), BuiltInContainerDefinitions()}) {
         for (const BuiltInDefinition& definition : table) {
@@ -40,7 +40,7 @@ bool isBuiltInDefinition(const Bytes& id) {
     return false;
 }
 
-void sortByPid(StoredObject& object) {
+void SortByPid(StoredObject& object) {
     std::sort(object.properties.begin(), object.properties.end(),
               [](const StoredProperty& a, const StoredProperty& b) { return a.pid < b.pid; });
 }
@@ -49,19 +49,19 @@ class ModelWriter {
 public:
     explicit ModelWriter(Model& model) : model_(model), closure_(model) {}
 
-    StoredObject write(Object& header) {
+    StoredObject Write(Object& header) {
         StoredObject storedHeader = object(header, prop::Header_Dictionary.pid);
         storedHeader.properties.push_back(
             reference(prop::Header_Dictionary.pid, u"Dictionary", dictionary(model_.dictionary())));
-        sortByPid(storedHeader);
+        SortByPid(storedHeader);
 
-        closure_.addMetaClasses();
-        closure_.addExtensions();
+        closure_.AddMetaClasses();
+        closure_.AddExtensions();
         StoredObject root;
-        root.classId = rootClassId;
-        root.properties.push_back(reference(meta::rootMetaDictionary, u"MetaDictionary",
-                                            storedMetaDictionary(closure_.records())));
-        root.properties.push_back(reference(meta::rootHeader, u"Header", std::move(storedHeader)));
+        root.classId = kRootClassId;
+        root.properties.push_back(reference(meta::kRootMetaDictionary, u"MetaDictionary",
+                                            StoredMetaDictionary(closure_.records())));
+        root.properties.push_back(reference(meta::kRootHeader, u"Header", std::move(storedHeader)));
         return root;
     }
 
@@ -79,40 +79,40 @@ private:
     // All properties of the object but the one that is left out.
     StoredObject object(const Object& from, PropertyId leftOut = kNoPropertyId) {
         StoredObject out;
-        out.classId = storedAuid(from.classId());
-        closure_.addClass(from.classId());
+        out.classId = AuidOf(from.classId());
+        closure_.AddClass(from.classId());
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
                 out.properties.push_back(property(from, entry.first, *entry.second));
             }
         }
-        addRequired(from, out, leftOut);
-        sortByPid(out);
+        AddRequired(from, out, leftOut);
+        SortByPid(out);
         return out;
     }
 
     StoredProperty property(const Object& from, PropertyId pid, const PropertyValue& value) {
         const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
         if (definition == nullptr || definition->type() == nullptr) {
-            throw StoredError(propertyText(pid) + " has no definition");
+            throw StoredError(PropertyText(pid) + " has no definition");
         }
-        StoredProperty out = emptyProperty(*definition);
-        if (storedFormOf(value.type()) != out.form) {
+        StoredProperty out = EmptyProperty(*definition);
+        if (StoredFormOf(value.type()) != out.form) {
             throw StoredError(text(*definition) + " holds a value of another form than its type");
         }
         try {
-            fill(out, *definition, value);
+            Fill(out, *definition, value);
         } catch (const StoredError& problem) {
             throw StoredError(text(*definition) + ": " + problem.what());
         }
         return out;
     }
 
-    void fill(StoredProperty& out, const PropertyDefinition& definition,
+    void Fill(StoredProperty& out, const PropertyDefinition& definition,
               const PropertyValue& value) {
         switch (out.form) {
             case StoredForm::Data:
-                noteCarriedType(value);
+                NoteCarriedType(value);
                 out.bytes = value.bytes();
                 break;
             case StoredForm::Stream:
@@ -131,27 +131,27 @@ private:
             case StoredForm::WeakReference:
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                addTargets(out, *definition.type(), value.bytes());
+                AddTargets(out, *definition.type(), value.bytes());
                 break;
         }
     }
 
     // A property of the right form and name that holds nothing yet.
-    StoredProperty emptyProperty(const PropertyDefinition& definition) {
+    StoredProperty EmptyProperty(const PropertyDefinition& definition) {
         StoredProperty out;
         out.pid = definition.pid();
-        out.name = utf16Of(definition.name());
-        out.form = storedFormOf(*definition.type());
+        out.name = Utf16Of(definition.name());
+        out.form = StoredFormOf(*definition.type());
         if (out.form == StoredForm::StrongSet) {
-            const TypeFacts target = FactsOf(referenceIn(*definition.type()));
-            const PropertyDefinition* key = keyOf(target.target);
+            const TypeFacts target = FactsOf(ReferenceIn(*definition.type()));
+            const PropertyDefinition* key = KeyOf(target.target);
             out.keyPid = key->pid();
             out.keySize = static_cast<std::uint8_t>(key->type()->StoredSize());
         }
         return out;
     }
 
-    const PropertyDefinition* keyOf(const GUID& classId) {
+    const PropertyDefinition* KeyOf(const GUID& classId) {
         const ClassDefinition* definition = model_.FindClass(classId);
         const PropertyDefinition* key =
             definition == nullptr ? nullptr : definition->FindUniqueProperty();
@@ -161,27 +161,27 @@ private:
         return key;
     }
 
-    void addTargets(StoredProperty& out, const TypeDefinition& type, const Bytes& ids) {
-        const TypeFacts reference = FactsOf(referenceIn(type));
+    void AddTargets(StoredProperty& out, const TypeDefinition& type, const Bytes& ids) {
+        const TypeFacts reference = FactsOf(ReferenceIn(type));
         for (const TypeMember& step : reference.members) {
-            out.targetPath.push_back(pidOf(step.id));
+            out.targetPath.push_back(PidOf(step.id));
         }
-        out.keyPid = keyOf(reference.target)->pid();
-        for (std::size_t at = 0; at + idSize <= ids.size(); at += idSize) {
+        out.keyPid = KeyOf(reference.target)->pid();
+        for (std::size_t at = 0; at + kIdSize <= ids.size(); at += kIdSize) {
             const auto from = ids.begin() + static_cast<std::ptrdiff_t>(at);
-            out.keys.emplace_back(from, from + idSize);
+            out.keys.emplace_back(from, from + kIdSize);
             if (targets_[out.targetPath].insert(out.keys.back()).second) {
-                noteMetaTarget(out.targetPath, guidOf(out.keys.back()));
+                NoteMetaTarget(out.targetPath, GuidOf(out.keys.back()));
             }
         }
     }
 
-    PropertyId pidOf(const GUID& property) {
-        if (property == rootMetaDictionaryId) {
-            return meta::rootMetaDictionary;
+    PropertyId PidOf(const GUID& property) {
+        if (property == kRootMetaDictionaryId) {
+            return meta::kRootMetaDictionary;
         }
-        if (property == rootHeaderId) {
-            return meta::rootHeader;
+        if (property == kRootHeaderId) {
+            return meta::kRootHeader;
         }
         if (const PropertyDefinition* known = model_.FindProperty(property)) {
             return known->pid();
@@ -191,43 +191,43 @@ private:
     }
 
     // References may also lead into the meta-dictionary.
-    void noteMetaTarget(const Path& path, const GUID& id) {
-        if (path == Path{meta::rootMetaDictionary, meta::classDefinitions}) {
-            closure_.addClass(id);
-        } else if (path == Path{meta::rootMetaDictionary, meta::typeDefinitions}) {
-            closure_.addType(id);
+    void NoteMetaTarget(const Path& path, const GUID& id) {
+        if (path == Path{meta::kRootMetaDictionary, meta::kClassDefinitions}) {
+            closure_.AddClass(id);
+        } else if (path == Path{meta::kRootMetaDictionary, meta::kTypeDefinitions}) {
+            closure_.AddType(id);
         }
     }
 
     // The type that an indirect value names has to be in the file.
-    void noteCarriedType(const PropertyValue& value) {
+    void NoteCarriedType(const PropertyValue& value) {
         const TypeKind kind = value.type().Resolved().kind();
         const Bytes& bytes = value.bytes();
-        if ((kind == TypeKind::Indirect || kind == TypeKind::Opaque) && bytes.size() > idSize) {
-            const GUID id = guidOf(Bytes(bytes.begin() + 1, bytes.begin() + 1 + idSize));
+        if ((kind == TypeKind::Indirect || kind == TypeKind::Opaque) && bytes.size() > kIdSize) {
+            const GUID id = GuidOf(Bytes(bytes.begin() + 1, bytes.begin() + 1 + kIdSize));
             if (model_.FindType(id) != nullptr) {
-                closure_.addType(id);
+                closure_.AddType(id);
             }
         }
     }
 
     // Readers want the collections that a class requires, and an (empty) set
     // of essence data; an object that is required and absent stops them.
-    void addRequired(const Object& from, StoredObject& out, PropertyId leftOut) {
-        for (const PropertyDefinition* definition : requiredObjects(from.classDefinition())) {
-            if (definition->pid() == leftOut || out.find(definition->pid()) != nullptr) {
+    void AddRequired(const Object& from, StoredObject& out, PropertyId leftOut) {
+        for (const PropertyDefinition* definition : RequiredObjects(from.classDefinition())) {
+            if (definition->pid() == leftOut || out.Find(definition->pid()) != nullptr) {
                 continue;
             }
-            StoredProperty empty = emptyProperty(*definition);
+            StoredProperty empty = EmptyProperty(*definition);
             if (empty.form == StoredForm::StrongReference) {
-                throw StoredError(toUtf8(from.classDefinition().name()) + " has no " +
-                                  toUtf8(definition->name()));
+                throw StoredError(ToUtf8(from.classDefinition().name()) + " has no " +
+                                  ToUtf8(definition->name()));
             }
             out.properties.push_back(std::move(empty));
         }
     }
 
-    const std::vector<const PropertyDefinition*>& requiredObjects(
+    const std::vector<const PropertyDefinition*>& RequiredObjects(
         const ClassDefinition& definition) {
         const auto known = required_.find(&definition);
         if (known != required_.end()) {
@@ -241,7 +241,7 @@ private:
                 if (!wanted || property->type() == nullptr) {
                     continue;
                 }
-                const StoredForm form = storedFormOf(*property->type());
+                const StoredForm form = StoredFormOf(*property->type());
                 if (form == StoredForm::StrongReference || form == StoredForm::StrongVector ||
                     form == StoredForm::StrongSet) {
                     out.push_back(property.get());
@@ -256,13 +256,13 @@ private:
     // the sets are gone through until nothing is added.
     StoredObject dictionary(const Object& from) {
         StoredObject out;
-        out.classId = storedAuid(from.classId());
-        closure_.addClass(from.classId());
+        out.classId = AuidOf(from.classId());
+        closure_.AddClass(from.classId());
         std::map<PropertyId, StoredProperty> sets;
         for (const auto& entry : from.values()) {
-            if (storedFormOf(entry.second->type()) == StoredForm::StrongSet) {
+            if (StoredFormOf(entry.second->type()) == StoredForm::StrongSet) {
                 sets[entry.first] =
-                    emptyProperty(*from.classDefinition().FindProperty(entry.first));
+                    EmptyProperty(*from.classDefinition().FindProperty(entry.first));
             } else {
                 out.properties.push_back(property(from, entry.first, *entry.second));
             }
@@ -272,7 +272,7 @@ private:
         do {
             before = stored.size();
             for (auto& set : sets) {
-                addDefinitions(set.second, from.values().at(set.first)->objects(), stored);
+                AddDefinitions(set.second, from.values().at(set.first)->objects(), stored);
             }
         } while (stored.size() != before);
         for (auto& set : sets) {
@@ -280,17 +280,17 @@ private:
                 out.properties.push_back(std::move(set.second));
             }
         }
-        checkTargets(out);
-        sortByPid(out);
+        CheckTargets(out);
+        SortByPid(out);
         return out;
     }
 
-    void addDefinitions(StoredProperty& set, const std::vector<RefPtr<Object>>& definitions,
+    void AddDefinitions(StoredProperty& set, const std::vector<RefPtr<Object>>& definitions,
                         std::set<const Object*>& stored) {
-        const Path path = {meta::rootHeader, prop::Header_Dictionary.pid, set.pid};
+        const Path path = {meta::kRootHeader, prop::Header_Dictionary.pid, set.pid};
         for (const RefPtr<Object>& definition : definitions) {
             const Bytes key = definition->UniqueKey();
-            const bool wanted = !isBuiltInDefinition(key) || targets_[path].count(key) != 0;
+            const bool wanted = !IsBuiltInDefinition(key) || targets_[path].count(key) != 0;
             if (wanted && stored.insert(definition.get()).second) {
                 set.keys.push_back(key);
                 set.objects.push_back(object(*definition));
@@ -299,26 +299,26 @@ private:
     }
 
     // Readers fail when a target is not where the reference says it is.
-    void checkTargets(const StoredObject& dictionary) {
+    void CheckTargets(const StoredObject& dictionary) {
         for (const auto& entry : targets_) {
             const Path& path = entry.first;
             if (path.size() != 3 || path[1] != prop::Header_Dictionary.pid) {
                 continue;
             }
-            const StoredProperty* set = dictionary.find(path[2]);
+            const StoredProperty* set = dictionary.Find(path[2]);
             for (const Bytes& key : entry.second) {
                 if (set == nullptr ||
                     std::find(set->keys.begin(), set->keys.end(), key) == set->keys.end()) {
                     throw StoredError(
                         "a definition that is referred to is not in the dictionary (" +
-                        propertyText(path[2]) + ")");
+                        PropertyText(path[2]) + ")");
                 }
             }
         }
     }
 
     static std::string text(const PropertyDefinition& definition) {
-        return toUtf8(definition.name());
+        return ToUtf8(definition.name());
     }
 
     Model& model_;
@@ -329,8 +329,8 @@ private:
 
 }  // namespace
 
-StoredObject treeOfModel(Model& model, Object& header) {
-    return ModelWriter(model).write(header);
+StoredObject TreeOfModel(Model& model, Object& header) {
+    return ModelWriter(model).Write(header);
 }
 
 }  // namespace aaf::stored

@@ -17,6 +17,6 @@ namespace aaf::stored {
 // every extension that is registered. Required collections that are absent are
 // stored empty. Throws StoredError when an object lacks one that it must hold,
 // such as a slot its segment.
-StoredObject treeOfModel(Model& model, Object& header);
+StoredObject TreeOfModel(Model& model, Object& header);
 
 }  // namespace aaf::stored

@@ -17,6 +17,6 @@ public:
 
 // Objects nested deeper than this are neither written nor read. Real files
 // stay below twenty; the limit keeps recursion harmless.
-constexpr int maximumDepth = 100;
+constexpr int kMaximumDepth = 100;
 
 }  // namespace aaf::stored

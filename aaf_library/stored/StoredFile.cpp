@@ -16,8 +16,8 @@
 
 namespace aaf::stored {
 
-const StoredAuid rootClassId = {0xA5, 0x98, 0xB3, 0xB3, 0x90, 0x1C, 0xD4, 0x11,
-                                0x80, 0x53, 0x08, 0x00, 0x36, 0x21, 0x08, 0x04};
+const StoredAuid kRootClassId = {0xA5, 0x98, 0xB3, 0xB3, 0x90, 0x1C, 0xD4, 0x11,
+                                 0x80, 0x53, 0x08, 0x00, 0x36, 0x21, 0x08, 0x04};
 
 namespace {
 
@@ -26,7 +26,7 @@ FileResult failed(FileFailure failure, const std::filesystem::path& path, const 
 }
 
 // What the last failed call of the C library left as its reason.
-FileResult systemFailure(const std::filesystem::path& path, const std::string& what) {
+FileResult SystemFailure(const std::filesystem::path& path, const std::string& what) {
     const int reason = errno;
     const FileFailure failure = reason == ENOENT ? FileFailure::NotThere : FileFailure::NoAccess;
     std::string text = what;
@@ -56,7 +56,7 @@ public:
         }
     }
 
-    bool write(const Bytes& bytes) {
+    bool Write(const Bytes& bytes) {
         errno = 0;
         std::ofstream out(path_, std::ios::binary | std::ios::trunc);
         exists_ = out.is_open();
@@ -66,7 +66,7 @@ public:
         return exists_ && !out.fail();
     }
 
-    std::error_code moveTo(const std::filesystem::path& target) {
+    std::error_code MoveTo(const std::filesystem::path& target) {
         std::error_code problem;
         std::filesystem::rename(path_, target, problem);
         exists_ = static_cast<bool>(problem);
@@ -78,18 +78,18 @@ private:
     bool exists_ = false;
 };
 
-FileResult replaceFile(const Bytes& bytes, const std::filesystem::path& path) {
+FileResult ReplaceFile(const Bytes& bytes, const std::filesystem::path& path) {
     TemporaryFile temporary(path);
-    if (!temporary.write(bytes)) {
-        return systemFailure(path, "cannot be written");
+    if (!temporary.Write(bytes)) {
+        return SystemFailure(path, "cannot be written");
     }
-    if (const std::error_code problem = temporary.moveTo(path)) {
+    if (const std::error_code problem = temporary.MoveTo(path)) {
         return failed(FileFailure::NoAccess, path, "cannot be replaced: " + problem.message());
     }
     return {};
 }
 
-FileResult readFile(const std::filesystem::path& path, Bytes& bytes) {
+FileResult ReadFile(const std::filesystem::path& path, Bytes& bytes) {
     std::error_code problem;
     if (std::filesystem::is_directory(path, problem)) {
         return failed(FileFailure::NoAccess, path, "is a folder");
@@ -97,7 +97,7 @@ FileResult readFile(const std::filesystem::path& path, Bytes& bytes) {
     errno = 0;
     std::ifstream in(path, std::ios::binary);
     if (!in) {
-        return systemFailure(path, "cannot be opened");
+        return SystemFailure(path, "cannot be opened");
     }
     constexpr std::size_t chunk = 1 << 20;
     while (in) {
@@ -107,33 +107,33 @@ FileResult readFile(const std::filesystem::path& path, Bytes& bytes) {
         bytes.resize(had + static_cast<std::size_t>(in.gcount()));
     }
     if (in.bad()) {
-        return systemFailure(path, "cannot be read");
+        return SystemFailure(path, "cannot be read");
     }
     return {};
 }
 
-bool carriesSignature(const std::uint8_t* header, std::size_t size, SectorSize* kind) {
-    if (size < signatureOffset + sizeof(StoredAuid) ||
-        std::memcmp(header, compoundMagic, sizeof(compoundMagic)) != 0) {
+bool CarriesSignature(const std::uint8_t* header, std::size_t size, SectorSize* kind) {
+    if (size < kSignatureOffset + sizeof(StoredAuid) ||
+        std::memcmp(header, kCompoundMagic, sizeof(kCompoundMagic)) != 0) {
         return false;
     }
     StoredAuid signature;
-    std::memcpy(signature.data(), header + signatureOffset, signature.size());
-    if (signature != signature512 && signature != signature4096) {
+    std::memcpy(signature.data(), header + kSignatureOffset, signature.size());
+    if (signature != kSignature512 && signature != kSignature4096) {
         return false;
     }
     if (kind != nullptr) {
-        *kind = signature == signature512 ? SectorSize::Bytes512 : SectorSize::Bytes4096;
+        *kind = signature == kSignature512 ? SectorSize::Bytes512 : SectorSize::Bytes4096;
     }
     return true;
 }
 
 }  // namespace
 
-FileResult saveTree(const StoredObject& root, const std::filesystem::path& path,
+FileResult SaveTree(const StoredObject& root, const std::filesystem::path& path,
                     SectorSize sectorSize) {
     try {
-        return replaceFile(writeTree(root, sectorSize), path);
+        return ReplaceFile(WriteTree(root, sectorSize), path);
     } catch (const StoredError& problem) {
         return failed(FileFailure::NotStorable, path, problem.what());
     } catch (const std::bad_alloc&) {
@@ -141,16 +141,16 @@ FileResult saveTree(const StoredObject& root, const std::filesystem::path& path,
     }
 }
 
-FileResult loadTree(const std::filesystem::path& path, StoredObject& root) {
+FileResult LoadTree(const std::filesystem::path& path, StoredObject& root) {
     try {
         Bytes bytes;
-        if (FileResult result = readFile(path, bytes); !result) {
+        if (FileResult result = ReadFile(path, bytes); !result) {
             return result;
         }
-        if (!carriesSignature(bytes.data(), bytes.size(), nullptr)) {
+        if (!CarriesSignature(bytes.data(), bytes.size(), nullptr)) {
             return failed(FileFailure::NotAaf, path, "is no AAF file");
         }
-        root = readTree(bytes);
+        root = ReadTree(bytes);
         return {};
     } catch (const StoredError& problem) {
         return failed(FileFailure::Damaged, path, problem.what());
@@ -159,11 +159,11 @@ FileResult loadTree(const std::filesystem::path& path, StoredObject& root) {
     }
 }
 
-bool isAafFile(const std::filesystem::path& path, SectorSize* kind) {
-    std::uint8_t header[signatureOffset + sizeof(StoredAuid)] = {};
+bool IsAafFile(const std::filesystem::path& path, SectorSize* kind) {
+    std::uint8_t header[kSignatureOffset + sizeof(StoredAuid)] = {};
     std::ifstream in(path, std::ios::binary);
     in.read(reinterpret_cast<char*>(header), sizeof(header));
-    return carriesSignature(header, static_cast<std::size_t>(in.gcount()), kind);
+    return CarriesSignature(header, static_cast<std::size_t>(in.gcount()), kind);
 }
 
 }  // namespace aaf::stored

@@ -32,17 +32,17 @@ struct FileResult {
 // Replaces the file as a whole: it is written under another name beside it
 // and put in place when it is complete. After a failure the old file stands
 // and nothing is left behind.
-FileResult saveTree(const StoredObject& root, const std::filesystem::path& path,
+FileResult SaveTree(const StoredObject& root, const std::filesystem::path& path,
                     SectorSize sectorSize);
 
 // Leaves the tree untouched on failure.
-FileResult loadTree(const std::filesystem::path& path, StoredObject& root);
+FileResult LoadTree(const std::filesystem::path& path, StoredObject& root);
 
 // Looks at the first bytes only. False also when the file cannot be read. The
 // kind is what the file's signature says; null when it is not wanted.
-bool isAafFile(const std::filesystem::path& path, SectorSize* kind);
+bool IsAafFile(const std::filesystem::path& path, SectorSize* kind);
 
 // Class of the object that holds everything, the root of every file.
-extern const StoredAuid rootClassId;
+extern const StoredAuid kRootClassId;
 
 }  // namespace aaf::stored

@@ -6,8 +6,8 @@ namespace aaf::stored {
 
 namespace {
 
-constexpr std::size_t singleSize = 32;
-constexpr std::size_t collectionSize = 22;  // leaves room for " index" and "{ffffffff}"
+constexpr std::size_t kSingleSize = 32;
+constexpr std::size_t kCollectionSize = 22;  // leaves room for " index" and "{ffffffff}"
 
 std::u16string hexadecimal(std::uint32_t value) {
     std::u16string digits;
@@ -29,7 +29,7 @@ std::u16string squeeze(const std::u16string& name, std::uint16_t pid, std::size_
     return name.substr(0, head) + u'-' + name.substr(name.size() - tail) + u'-' + digits;
 }
 
-void appendUtf8(std::string& out, std::uint32_t point) {
+void AppendUtf8(std::string& out, std::uint32_t point) {
     if (point < 0x80) {
         out += static_cast<char>(point);
     } else if (point < 0x800) {
@@ -47,33 +47,33 @@ void appendUtf8(std::string& out, std::uint32_t point) {
     }
 }
 
-bool isHighHalf(char16_t unit) {
+bool IsHighHalf(char16_t unit) {
     return unit >= 0xD800 && unit < 0xDC00;
 }
 
-bool isLowHalf(char16_t unit) {
+bool IsLowHalf(char16_t unit) {
     return unit >= 0xDC00 && unit < 0xE000;
 }
 
 }  // namespace
 
-std::u16string singleName(const std::u16string& property, std::uint16_t pid) {
-    return squeeze(property, pid, singleSize);
+std::u16string SingleName(const std::u16string& property, std::uint16_t pid) {
+    return squeeze(property, pid, kSingleSize);
 }
 
-std::u16string collectionName(const std::u16string& property, std::uint16_t pid) {
-    return squeeze(property, pid, collectionSize);
+std::u16string CollectionName(const std::u16string& property, std::uint16_t pid) {
+    return squeeze(property, pid, kCollectionSize);
 }
 
-std::u16string indexName(const std::u16string& collection) {
+std::u16string IndexName(const std::u16string& collection) {
     return collection + u" index";
 }
 
-std::u16string elementName(const std::u16string& collection, std::uint32_t localKey) {
+std::u16string ElementName(const std::u16string& collection, std::uint32_t localKey) {
     return collection + u'{' + hexadecimal(localKey) + u'}';
 }
 
-std::u16string propertyPart(const std::u16string& storedName, std::uint16_t pid) {
+std::u16string PropertyPart(const std::u16string& storedName, std::uint16_t pid) {
     const std::u16string ending = u'-' + hexadecimal(pid);
     if (storedName.size() <= ending.size() ||
         storedName.compare(storedName.size() - ending.size(), ending.size(), ending) != 0) {
@@ -82,21 +82,21 @@ std::u16string propertyPart(const std::u16string& storedName, std::uint16_t pid)
     return storedName.substr(0, storedName.size() - ending.size());
 }
 
-std::string propertyText(std::uint16_t pid) {
+std::string PropertyText(std::uint16_t pid) {
     const std::u16string digits = hexadecimal(pid);
-    return "property " + std::string(4 - digits.size(), '0') + toUtf8(digits);
+    return "property " + std::string(4 - digits.size(), '0') + ToUtf8(digits);
 }
 
-std::string toUtf8(const std::u16string& text) {
+std::string ToUtf8(const std::u16string& text) {
     std::string out;
     for (std::size_t i = 0; i < text.size(); ++i) {
-        if (isHighHalf(text[i]) && i + 1 < text.size() && isLowHalf(text[i + 1])) {
-            appendUtf8(out, 0x10000 + ((text[i] - 0xD800u) << 10) + (text[i + 1] - 0xDC00u));
+        if (IsHighHalf(text[i]) && i + 1 < text.size() && IsLowHalf(text[i + 1])) {
+            AppendUtf8(out, 0x10000 + ((text[i] - 0xD800u) << 10) + (text[i + 1] - 0xDC00u));
             ++i;
-        } else if (isHighHalf(text[i]) || isLowHalf(text[i])) {
+        } else if (IsHighHalf(text[i]) || IsLowHalf(text[i])) {
             out += '?';
         } else {
-            appendUtf8(out, text[i]);
+            AppendUtf8(out, text[i]);
         }
     }
     return out;

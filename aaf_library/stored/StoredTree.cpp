@@ -4,7 +4,7 @@
 
 namespace aaf::stored {
 
-const StoredProperty* StoredObject::find(std::uint16_t pid) const {
+const StoredProperty* StoredObject::Find(std::uint16_t pid) const {
     for (const StoredProperty& property : properties) {
         if (property.pid == pid) {
             return &property;

@@ -41,7 +41,7 @@ struct StoredObject {
     StoredAuid classId{};
     std::vector<StoredProperty> properties;
 
-    const StoredProperty* find(std::uint16_t pid) const;
+    const StoredProperty* Find(std::uint16_t pid) const;
 };
 
 // One property. Which fields count is told by the form.

@@ -20,37 +20,37 @@ class TreeReader {
 public:
     explicit TreeReader(const Bytes& file) : file_(file) {}
 
-    StoredObject read() {
-        readTargetPaths();
-        return object(CompoundFileReader::rootIndex, 0);
+    StoredObject Read() {
+        ReadTargetPaths();
+        return object(CompoundFileReader::kRootIndex, 0);
     }
 
 private:
     // The entry of that name in a storage. Each is handed out once, so no two
     // properties can share an object.
-    std::uint32_t take(const Entry& storage, const std::u16string& name, Kind kind) {
+    std::uint32_t Take(const Entry& storage, const std::u16string& name, Kind kind) {
         const auto found = storage.contained.find(name);
         if (found == storage.contained.end() || file_.entry(found->second).kind != kind) {
-            throw StoredError("\"" + toUtf8(name) + "\" is missing");
+            throw StoredError("\"" + ToUtf8(name) + "\" is missing");
         }
         if (!taken_.insert(found->second).second) {
-            throw StoredError("\"" + toUtf8(name) + "\" is referred to twice");
+            throw StoredError("\"" + ToUtf8(name) + "\" is referred to twice");
         }
         return found->second;
     }
 
     Bytes stream(const Entry& storage, const std::u16string& name) {
-        return file_.read(take(storage, name, Kind::Stream));
+        return file_.Read(Take(storage, name, Kind::Stream));
     }
 
-    void readTargetPaths() {
-        const Entry& root = file_.entry(CompoundFileReader::rootIndex);
-        if (root.contained.count(referencedPropertiesStream) == 0) {
+    void ReadTargetPaths() {
+        const Entry& root = file_.entry(CompoundFileReader::kRootIndex);
+        if (root.contained.count(kReferencedPropertiesStream) == 0) {
             return;  // a file without weak references
         }
-        const Bytes table = stream(root, referencedPropertiesStream);
+        const Bytes table = stream(root, kReferencedPropertiesStream);
         ByteReader from(table);
-        checkOrder(from.number<std::uint8_t>());
+        CheckOrder(from.number<std::uint8_t>());
         const auto count = from.number<std::uint16_t>();
         const auto values = from.number<std::uint32_t>();
         if (from.left() / 2 < values) {
@@ -72,23 +72,23 @@ private:
         }
     }
 
-    static void checkOrder(std::uint8_t mark) {
-        if (mark != littleEndianMark) {
-            throw StoredError(mark == bigEndianMark ? "big-endian files are not supported"
-                                                    : "unknown byte order");
+    static void CheckOrder(std::uint8_t mark) {
+        if (mark != kLittleEndianMark) {
+            throw StoredError(mark == kBigEndianMark ? "big-endian files are not supported"
+                                                     : "unknown byte order");
         }
     }
 
     StoredObject object(std::uint32_t index, int depth) {
-        if (depth > maximumDepth) {
+        if (depth > kMaximumDepth) {
             throw StoredError("objects are nested too deep");
         }
         const Entry& storage = file_.entry(index);
         StoredObject object;
         object.classId = storage.classId;
-        const Bytes table = stream(storage, propertiesStream);
+        const Bytes table = stream(storage, kPropertiesStream);
         ByteReader entries(table);
-        checkOrder(entries.number<std::uint8_t>());
+        CheckOrder(entries.number<std::uint8_t>());
         entries.number<std::uint8_t>();  // the version, of which only one was ever in use
         const auto count = entries.number<std::uint16_t>();
         ByteReader values = entries;
@@ -106,38 +106,38 @@ private:
                     throw StoredError("occurs twice");
                 }
                 if (size != 0) {
-                    resolve(storage, property, depth);
+                    Resolve(storage, property, depth);
                     object.properties.push_back(std::move(property));
                 }
             } catch (const StoredError& problem) {
-                throw StoredError(propertyText(property.pid) + ": " + problem.what());
+                throw StoredError(PropertyText(property.pid) + ": " + problem.what());
             }
         }
         return object;
     }
 
     // Turns the bytes of the entry into what they lead to.
-    void resolve(const Entry& storage, StoredProperty& property, int depth) {
+    void Resolve(const Entry& storage, StoredProperty& property, int depth) {
         const Bytes value = std::move(property.bytes);
         property.bytes.clear();
         switch (property.form) {
             case StoredForm::StrongReference: {
-                const std::u16string name = storedName(property, ByteReader(value));
+                const std::u16string name = StoredName(property, ByteReader(value));
                 property.objects.push_back(contained(storage, name, depth));
                 return;
             }
             case StoredForm::StrongVector:
             case StoredForm::StrongSet:
-                return readStrongCollection(storage, property, value, depth);
+                return ReadStrongCollection(storage, property, value, depth);
             case StoredForm::WeakReference:
-                return readWeakReference(property, value);
+                return ReadWeakReference(property, value);
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                return readWeakCollection(storage, property, value);
+                return ReadWeakCollection(storage, property, value);
             case StoredForm::Stream: {
                 ByteReader from(value);
                 from.number<std::uint8_t>();  // the byte order, of no use for plain bytes
-                property.bytes = stream(storage, storedName(property, from));
+                property.bytes = stream(storage, StoredName(property, from));
                 return;
             }
             case StoredForm::Data:
@@ -146,34 +146,34 @@ private:
         property.bytes = value;
     }
 
-    static std::u16string storedName(StoredProperty& property, ByteReader from) {
+    static std::u16string StoredName(StoredProperty& property, ByteReader from) {
         std::u16string name = from.text();
-        property.name = propertyPart(name, property.pid);
+        property.name = PropertyPart(name, property.pid);
         return name;
     }
 
     StoredObject contained(const Entry& storage, const std::u16string& name, int depth) {
-        const std::uint32_t index = take(storage, name, Kind::Storage);
+        const std::uint32_t index = Take(storage, name, Kind::Storage);
         try {
             return object(index, depth + 1);
         } catch (const StoredError& problem) {
-            throw StoredError(toUtf8(name) + ": " + problem.what());
+            throw StoredError(ToUtf8(name) + ": " + problem.what());
         }
     }
 
-    void readStrongCollection(const Entry& storage, StoredProperty& property, const Bytes& value,
+    void ReadStrongCollection(const Entry& storage, StoredProperty& property, const Bytes& value,
                               int depth) {
         const bool isSet = property.form == StoredForm::StrongSet;
-        const std::u16string name = storedName(property, ByteReader(value));
-        const Bytes index = stream(storage, indexName(name));
+        const std::u16string name = StoredName(property, ByteReader(value));
+        const Bytes index = stream(storage, IndexName(name));
         ByteReader from(index);
         const auto count = from.number<std::uint32_t>();
         from.bytes(8);  // which keys are free; only a writer would want to know
         if (isSet) {
             property.keyPid = from.number<std::uint16_t>();
-            readKeySize(property, from);
+            ReadKeySize(property, from);
         }
-        checkCount(count, from.left(), isSet ? std::size_t{8} + property.keySize : 4);
+        CheckCount(count, from.left(), isSet ? std::size_t{8} + property.keySize : 4);
         property.objects.reserve(count);
         for (std::uint32_t i = 0; i < count; ++i) {
             const auto localKey = from.number<std::uint32_t>();
@@ -181,36 +181,36 @@ private:
                 from.number<std::uint32_t>();  // the count of references
                 property.keys.push_back(from.bytes(property.keySize));
             }
-            property.objects.push_back(contained(storage, elementName(name, localKey), depth));
+            property.objects.push_back(contained(storage, ElementName(name, localKey), depth));
         }
         if (isSet) {
-            checkUnique(property.keys);
+            CheckUnique(property.keys);
         }
     }
 
-    void readWeakReference(StoredProperty& property, const Bytes& value) {
+    void ReadWeakReference(StoredProperty& property, const Bytes& value) {
         ByteReader from(value);
-        readTarget(property, from);
-        readKeySize(property, from);
+        ReadTarget(property, from);
+        ReadKeySize(property, from);
         property.keys.push_back(from.bytes(property.keySize));
     }
 
-    void readWeakCollection(const Entry& storage, StoredProperty& property, const Bytes& value) {
-        const Bytes index = stream(storage, indexName(storedName(property, ByteReader(value))));
+    void ReadWeakCollection(const Entry& storage, StoredProperty& property, const Bytes& value) {
+        const Bytes index = stream(storage, IndexName(StoredName(property, ByteReader(value))));
         ByteReader from(index);
         const auto count = from.number<std::uint32_t>();
-        readTarget(property, from);
-        readKeySize(property, from);
-        checkCount(count, from.left(), property.keySize);
+        ReadTarget(property, from);
+        ReadKeySize(property, from);
+        CheckCount(count, from.left(), property.keySize);
         for (std::uint32_t i = 0; i < count; ++i) {
             property.keys.push_back(from.bytes(property.keySize));
         }
         if (property.form == StoredForm::WeakSet) {
-            checkUnique(property.keys);
+            CheckUnique(property.keys);
         }
     }
 
-    void readTarget(StoredProperty& property, ByteReader& from) {
+    void ReadTarget(StoredProperty& property, ByteReader& from) {
         const auto tag = from.number<std::uint16_t>();
         property.keyPid = from.number<std::uint16_t>();
         if (tag >= paths_.size()) {
@@ -220,21 +220,21 @@ private:
         property.targetPath = paths_[tag];
     }
 
-    static void readKeySize(StoredProperty& property, ByteReader& from) {
+    static void ReadKeySize(StoredProperty& property, ByteReader& from) {
         property.keySize = from.number<std::uint8_t>();
-        if (!isKeySize(property.keySize)) {
+        if (!IsKeySize(property.keySize)) {
             throw StoredError("a key of " + std::to_string(property.keySize) + " bytes");
         }
     }
 
-    static void checkCount(std::uint32_t count, std::size_t left, std::size_t each) {
+    static void CheckCount(std::uint32_t count, std::size_t left, std::size_t each) {
         if (count > left / each) {
             throw StoredError("the index counts " + std::to_string(count) + " elements, " +
                               std::to_string(left) + " bytes left");
         }
     }
 
-    static void checkUnique(const std::vector<Bytes>& keys) {
+    static void CheckUnique(const std::vector<Bytes>& keys) {
         if (std::set<Bytes>(keys.begin(), keys.end()).size() != keys.size()) {
             throw StoredError("a set has a key twice");
         }
@@ -247,8 +247,8 @@ private:
 
 }  // namespace
 
-StoredObject readTree(const Bytes& file) {
-    return TreeReader(file).read();
+StoredObject ReadTree(const Bytes& file) {
+    return TreeReader(file).Read();
 }
 
 }  // namespace aaf::stored

@@ -10,6 +10,6 @@ namespace aaf::stored {
 // storage and stream is taken once, every count is held against the bytes
 // that are there. Storages and streams that no property names are passed over.
 // Throws StoredError with the place and the defect.
-StoredObject readTree(const Bytes& file);
+StoredObject ReadTree(const Bytes& file);
 
 }  // namespace aaf::stored

@@ -27,7 +27,7 @@ namespace aaf::stored {
 
 namespace {
 
-constexpr std::size_t largestValue = 0xFFFF;
+constexpr std::size_t kLargestValue = 0xFFFF;
 
 // The table of paths to the sets that weak references lead to. A path gets
 // its tag when it is used first.
@@ -57,10 +57,10 @@ public:
             pids.number(std::uint16_t{0});
         }
         return ByteWriter()
-            .number(littleEndianMark)
+            .number(kLittleEndianMark)
             .number(static_cast<std::uint16_t>(paths_.size()))
             .number(static_cast<std::uint32_t>(pids.bytes().size() / 2))
-            .append(pids.bytes())
+            .Append(pids.bytes())
             .bytes();
     }
 
@@ -88,25 +88,25 @@ struct Layout {
     std::vector<Child> children;
     std::vector<Stream> streams;
 
-    void add(const StoredProperty& property, const Bytes& value) {
-        if (value.size() > largestValue) {
+    void Add(const StoredProperty& property, const Bytes& value) {
+        if (value.size() > kLargestValue) {
             throw StoredError(std::to_string(value.size()) + " bytes, a value may take " +
-                              std::to_string(largestValue));
+                              std::to_string(kLargestValue));
         }
         entries.number(property.pid)
             .number(static_cast<std::uint16_t>(property.form))
             .number(static_cast<std::uint16_t>(value.size()));
-        values.append(value);
+        values.Append(value);
         ++count;
     }
 };
 
-Bytes nameValue(const std::u16string& name) {
+Bytes NameValue(const std::u16string& name) {
     return ByteWriter().text(name).bytes();
 }
 
-std::uint8_t checkedKeySize(const StoredProperty& property) {
-    if (!isKeySize(property.keySize)) {
+std::uint8_t CheckedKeySize(const StoredProperty& property) {
+    if (!IsKeySize(property.keySize)) {
         throw StoredError("keys of " + std::to_string(property.keySize) + " bytes");
     }
     for (const Bytes& key : property.keys) {
@@ -121,17 +121,17 @@ class TreeWriter {
 public:
     explicit TreeWriter(SectorSize sectorSize) : file_(sectorSize) {}
 
-    Bytes write(const StoredObject& root) {
-        fill(file_.root(), root, 0);
+    Bytes Write(const StoredObject& root) {
+        Fill(file_.root(), root, 0);
         // Tags are handed out on the way, so the table comes last. Readers
         // want it, even without a path in it.
-        file_.root().stream(referencedPropertiesStream, paths_.table());
-        return file_.finish();
+        file_.root().stream(kReferencedPropertiesStream, paths_.table());
+        return file_.Finish();
     }
 
 private:
-    void fill(StorageWriter& storage, const StoredObject& object, int depth) {
-        if (depth > maximumDepth) {
+    void Fill(StorageWriter& storage, const StoredObject& object, int depth) {
+        if (depth > kMaximumDepth) {
             throw StoredError("objects are nested too deep");
         }
         Layout layout;
@@ -141,107 +141,107 @@ private:
                 if (!pids.insert(property.pid).second) {
                     throw StoredError("occurs twice in one object");
                 }
-                addProperty(layout, property);
+                AddProperty(layout, property);
             } catch (const StoredError& problem) {
-                throw StoredError(propertyText(property.pid) + ": " + problem.what());
+                throw StoredError(PropertyText(property.pid) + ": " + problem.what());
             }
         }
-        writeLayout(storage, object, layout, depth);
+        WriteLayout(storage, object, layout, depth);
     }
 
-    void writeLayout(StorageWriter& storage, const StoredObject& object, const Layout& layout,
+    void WriteLayout(StorageWriter& storage, const StoredObject& object, const Layout& layout,
                      int depth) {
-        storage.setClass(object.classId);
-        storage.stream(propertiesStream, ByteWriter()
-                                             .number(littleEndianMark)
-                                             .number(propertiesVersion)
-                                             .number(static_cast<std::uint16_t>(layout.count))
-                                             .append(layout.entries.bytes())
-                                             .append(layout.values.bytes())
-                                             .bytes());
+        storage.SetClass(object.classId);
+        storage.stream(kPropertiesStream, ByteWriter()
+                                              .number(kLittleEndianMark)
+                                              .number(kPropertiesVersion)
+                                              .number(static_cast<std::uint16_t>(layout.count))
+                                              .Append(layout.entries.bytes())
+                                              .Append(layout.values.bytes())
+                                              .bytes());
         for (const Layout::Stream& stream : layout.streams) {
             storage.stream(stream.name, stream.borrowed ? *stream.borrowed : stream.made);
         }
         for (const Layout::Child& child : layout.children) {
             StorageWriter contained = storage.storage(child.name);
             try {
-                fill(contained, *child.object, depth + 1);
+                Fill(contained, *child.object, depth + 1);
             } catch (const StoredError& problem) {
-                throw StoredError(toUtf8(child.name) + ": " + problem.what());
+                throw StoredError(ToUtf8(child.name) + ": " + problem.what());
             }
-            contained.close();
+            contained.Close();
         }
     }
 
-    void addProperty(Layout& layout, const StoredProperty& property) {
+    void AddProperty(Layout& layout, const StoredProperty& property) {
         switch (property.form) {
             case StoredForm::StrongReference:
-                return addStrongReference(layout, property);
+                return AddStrongReference(layout, property);
             case StoredForm::StrongVector:
-                return addStrongVector(layout, property);
+                return AddStrongVector(layout, property);
             case StoredForm::StrongSet:
-                return addStrongSet(layout, property);
+                return AddStrongSet(layout, property);
             case StoredForm::WeakReference:
-                return addWeakReference(layout, property);
+                return AddWeakReference(layout, property);
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                return addWeakCollection(layout, property);
+                return AddWeakCollection(layout, property);
             case StoredForm::Stream:
-                return addStream(layout, property);
+                return AddStream(layout, property);
             case StoredForm::Data:
                 break;
         }
         if (!property.bytes.empty()) {
-            layout.add(property, property.bytes);
+            layout.Add(property, property.bytes);
         }
     }
 
-    static void addStrongReference(Layout& layout, const StoredProperty& property) {
+    static void AddStrongReference(Layout& layout, const StoredProperty& property) {
         if (property.objects.size() != 1) {
             throw StoredError("a strong reference holds one object, not " +
                               std::to_string(property.objects.size()));
         }
-        const std::u16string name = singleName(property.name, property.pid);
-        layout.add(property, nameValue(name));
+        const std::u16string name = SingleName(property.name, property.pid);
+        layout.Add(property, NameValue(name));
         layout.children.push_back({name, &property.objects.front()});
     }
 
-    static void addStrongVector(Layout& layout, const StoredProperty& property) {
-        const std::u16string name = collectionName(property.name, property.pid);
+    static void AddStrongVector(Layout& layout, const StoredProperty& property) {
+        const std::u16string name = CollectionName(property.name, property.pid);
         const auto count = static_cast<std::uint32_t>(property.objects.size());
         ByteWriter index;
-        index.number(count).number(count).number(noLastFreeKey);
+        index.number(count).number(count).number(kNoLastFreeKey);
         for (std::uint32_t i = 0; i < count; ++i) {
             index.number(i);
-            layout.children.push_back({elementName(name, i), &property.objects[i]});
+            layout.children.push_back({ElementName(name, i), &property.objects[i]});
         }
-        layout.add(property, nameValue(name));
-        layout.streams.push_back({indexName(name), index.bytes(), nullptr});
+        layout.Add(property, NameValue(name));
+        layout.streams.push_back({IndexName(name), index.bytes(), nullptr});
     }
 
-    static void addStrongSet(Layout& layout, const StoredProperty& property) {
-        const std::u16string name = collectionName(property.name, property.pid);
-        const std::vector<std::size_t> order = keyOrder(property);
+    static void AddStrongSet(Layout& layout, const StoredProperty& property) {
+        const std::u16string name = CollectionName(property.name, property.pid);
+        const std::vector<std::size_t> order = KeyOrder(property);
         const auto count = static_cast<std::uint32_t>(order.size());
         ByteWriter index;
-        index.number(count).number(count).number(noLastFreeKey);
-        index.number(property.keyPid).number(checkedKeySize(property));
+        index.number(count).number(count).number(kNoLastFreeKey);
+        index.number(property.keyPid).number(CheckedKeySize(property));
         for (std::uint32_t i = 0; i < count; ++i) {
             const StoredObject& object = property.objects[order[i]];
             const Bytes& key = property.keys[order[i]];
-            const StoredProperty* stored = object.find(property.keyPid);
+            const StoredProperty* stored = object.Find(property.keyPid);
             if (stored == nullptr || stored->bytes != key) {
                 throw StoredError("an element does not store its key");
             }
-            index.number(i).number(setReferenceCount).append(key);
-            layout.children.push_back({elementName(name, i), &object});
+            index.number(i).number(kSetReferenceCount).Append(key);
+            layout.children.push_back({ElementName(name, i), &object});
         }
-        layout.add(property, nameValue(name));
-        layout.streams.push_back({indexName(name), index.bytes(), nullptr});
+        layout.Add(property, NameValue(name));
+        layout.streams.push_back({IndexName(name), index.bytes(), nullptr});
     }
 
     // The places of the elements in the order of their keys, which are unique.
-    static std::vector<std::size_t> keyOrder(const StoredProperty& property) {
+    static std::vector<std::size_t> KeyOrder(const StoredProperty& property) {
         const std::vector<Bytes>& keys = property.keys;
         if (keys.size() != property.objects.size()) {
             throw StoredError("a set has " + std::to_string(property.objects.size()) +
@@ -259,36 +259,36 @@ private:
         return order;
     }
 
-    void addWeakReference(Layout& layout, const StoredProperty& property) {
+    void AddWeakReference(Layout& layout, const StoredProperty& property) {
         if (property.keys.size() != 1) {
             throw StoredError("a weak reference has one key, not " +
                               std::to_string(property.keys.size()));
         }
-        layout.add(property, ByteWriter()
+        layout.Add(property, ByteWriter()
                                  .number(paths_.tag(property.targetPath))
                                  .number(property.keyPid)
-                                 .number(checkedKeySize(property))
-                                 .append(property.keys.front())
+                                 .number(CheckedKeySize(property))
+                                 .Append(property.keys.front())
                                  .bytes());
     }
 
-    void addWeakCollection(Layout& layout, const StoredProperty& property) {
+    void AddWeakCollection(Layout& layout, const StoredProperty& property) {
         if (property.keys.empty()) {
             return;
         }
-        const std::u16string name = collectionName(property.name, property.pid);
+        const std::u16string name = CollectionName(property.name, property.pid);
         ByteWriter index;
         index.number(static_cast<std::uint32_t>(property.keys.size()));
         index.number(paths_.tag(property.targetPath)).number(property.keyPid);
-        index.number(checkedKeySize(property));
-        for (const Bytes& key : inOrder(property)) {
-            index.append(key);
+        index.number(CheckedKeySize(property));
+        for (const Bytes& key : InOrder(property)) {
+            index.Append(key);
         }
-        layout.add(property, nameValue(name));
-        layout.streams.push_back({indexName(name), index.bytes(), nullptr});
+        layout.Add(property, NameValue(name));
+        layout.streams.push_back({IndexName(name), index.bytes(), nullptr});
     }
 
-    static std::vector<Bytes> inOrder(const StoredProperty& property) {
+    static std::vector<Bytes> InOrder(const StoredProperty& property) {
         std::vector<Bytes> keys = property.keys;
         if (property.form == StoredForm::WeakSet) {
             std::sort(keys.begin(), keys.end());
@@ -299,12 +299,12 @@ private:
         return keys;
     }
 
-    static void addStream(Layout& layout, const StoredProperty& property) {
+    static void AddStream(Layout& layout, const StoredProperty& property) {
         if (property.bytes.empty()) {
             return;
         }
-        const std::u16string name = singleName(property.name, property.pid);
-        layout.add(property, ByteWriter().number(streamMark).text(name).bytes());
+        const std::u16string name = SingleName(property.name, property.pid);
+        layout.Add(property, ByteWriter().number(kStreamMark).text(name).bytes());
         layout.streams.push_back({name, {}, &property.bytes});
     }
 
@@ -314,8 +314,8 @@ private:
 
 }  // namespace
 
-Bytes writeTree(const StoredObject& root, SectorSize sectorSize) {
-    return TreeWriter(sectorSize).write(root);
+Bytes WriteTree(const StoredObject& root, SectorSize sectorSize) {
+    return TreeWriter(sectorSize).Write(root);
 }
 
 }  // namespace aaf::stored

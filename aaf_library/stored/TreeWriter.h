@@ -10,6 +10,6 @@ namespace aaf::stored {
 // value, an empty stream, a weak collection without targets) are left out,
 // since readers take an entry without bytes amiss; sets are written in the
 // order of their keys. The same tree gives the same bytes. Throws StoredError.
-Bytes writeTree(const StoredObject& root, SectorSize sectorSize);
+Bytes WriteTree(const StoredObject& root, SectorSize sectorSize);
 
 }  // namespace aaf::stored

@@ -16,14 +16,14 @@ using namespace aaf::stored;
 namespace {
 
 // Whatever can be read must come out the same when it is written and read again.
-void checkTree(const StoredObject& tree) {
+void CheckTree(const StoredObject& tree) {
     Bytes written;
     try {
-        written = writeTree(tree, SectorSize::Bytes512);
+        written = WriteTree(tree, SectorSize::Bytes512);
     } catch (const StoredError&) {
         return;
     }
-    if (writeTree(readTree(written), SectorSize::Bytes512) != written) {
+    if (WriteTree(ReadTree(written), SectorSize::Bytes512) != written) {
         std::abort();
     }
 }
@@ -34,11 +34,11 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     static const aaf::ClassRegistry classes;
     const fuzz::TimeLimit limit;
     try {
-        const StoredObject tree = readTree(Bytes(data, data + size));
-        checkTree(tree);
+        const StoredObject tree = ReadTree(Bytes(data, data + size));
+        CheckTree(tree);
         const aaf::RefPtr<aaf::Model> model = aaf::Model::Create(classes);
-        const aaf::RefPtr<aaf::Object> header = readModel(tree, *model);
-        treeOfModel(*model, *header);
+        const aaf::RefPtr<aaf::Object> header = ReadModel(tree, *model);
+        TreeOfModel(*model, *header);
     } catch (const StoredError&) {
         // Refused, as most of what a fuzzer makes should be.
     }

@@ -15,7 +15,7 @@ std::wstring wide(const char* ascii) {
 
 }  // namespace
 
-MetaRecords builtInRecords() {
+MetaRecords BuiltInRecords() {
     MetaRecords records;
     std::uint16_t localPid = 0xFFFF;
     for (const BuiltInClass& entry : BuiltInClasses()) {

@@ -8,6 +8,6 @@ namespace aaf::stored::sample {
 
 // The whole built-in model as the records of one file; local numbers are
 // given out as a file would do it.
-MetaRecords builtInRecords();
+MetaRecords BuiltInRecords();
 
 }  // namespace aaf::stored::sample

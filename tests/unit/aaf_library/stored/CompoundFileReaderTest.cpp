@@ -12,17 +12,17 @@ using namespace aaf::stored;
 
 namespace {
 
-Bytes threeStreams() {
+Bytes ThreeStreams() {
     CompoundFileWriter writer(SectorSize::Bytes512);
     writer.root().stream(u"a", Bytes(10, 1));
     writer.root().stream(u"b", Bytes(5000, 2));
     StorageWriter inner = writer.root().storage(u"inner");
     inner.stream(u"c", Bytes(100, 3));
-    inner.close();
-    return writer.finish();
+    inner.Close();
+    return writer.Finish();
 }
 
-std::uint32_t numberAt(const Bytes& file, std::size_t at) {
+std::uint32_t NumberAt(const Bytes& file, std::size_t at) {
     return file[at] | file[at + 1] << 8 | file[at + 2] << 16 |
            static_cast<std::uint32_t>(file[at + 3]) << 24;
 }
@@ -35,16 +35,16 @@ void put(Bytes& file, std::size_t at, std::uint32_t value) {
 
 // Where the directory entry of that number stands; the sample's directory is
 // short enough for its sectors to follow one another.
-std::size_t entryAt(const Bytes& file, std::size_t index) {
-    return (numberAt(file, firstDirectoryOffset) + 1) * 512 + index * directoryEntrySize;
+std::size_t EntryAt(const Bytes& file, std::size_t index) {
+    return (NumberAt(file, kFirstDirectoryOffset) + 1) * 512 + index * kDirectoryEntrySize;
 }
 
 std::string refusal(const Bytes& file) {
     try {
         CompoundFileReader reader(file);
-        for (const auto& contained : reader.entry(CompoundFileReader::rootIndex).contained) {
+        for (const auto& contained : reader.entry(CompoundFileReader::kRootIndex).contained) {
             if (reader.entry(contained.second).kind == CompoundFileReader::Kind::Stream) {
-                reader.read(contained.second);
+                reader.Read(contained.second);
             }
         }
         return "";
@@ -53,109 +53,109 @@ std::string refusal(const Bytes& file) {
     }
 }
 
-constexpr std::size_t leftOffset = 68;
-constexpr std::size_t rightOffset = 72;
-constexpr std::size_t childOffset = 76;
-constexpr std::size_t startOffset = 116;
-constexpr std::size_t sizeOffset = 120;
+constexpr std::size_t kLeftOffset = 68;
+constexpr std::size_t kRightOffset = 72;
+constexpr std::size_t kChildOffset = 76;
+constexpr std::size_t kStartOffset = 116;
+constexpr std::size_t kSizeOffset = 120;
 
 }  // namespace
 
 TEST(CompoundFileReader, ReadsStreamsOfBothKindsAndNestedStorages) {
-    const Bytes file = threeStreams();
+    const Bytes file = ThreeStreams();
     CompoundFileReader reader(file);
-    const auto& root = reader.entry(CompoundFileReader::rootIndex).contained;
+    const auto& root = reader.entry(CompoundFileReader::kRootIndex).contained;
     ASSERT_EQ(root.size(), 3u);
-    EXPECT_EQ(reader.read(root.at(u"a")), Bytes(10, 1));
-    EXPECT_EQ(reader.read(root.at(u"b")), Bytes(5000, 2));
+    EXPECT_EQ(reader.Read(root.at(u"a")), Bytes(10, 1));
+    EXPECT_EQ(reader.Read(root.at(u"b")), Bytes(5000, 2));
     const auto& inner = reader.entry(root.at(u"inner")).contained;
-    EXPECT_EQ(reader.read(inner.at(u"c")), Bytes(100, 3));
+    EXPECT_EQ(reader.Read(inner.at(u"c")), Bytes(100, 3));
 }
 
 TEST(CompoundFileReader, GivesAStreamOutOnce) {
-    const Bytes file = threeStreams();
+    const Bytes file = ThreeStreams();
     CompoundFileReader reader(file);
-    const auto& root = reader.entry(CompoundFileReader::rootIndex).contained;
-    reader.read(root.at(u"a"));
-    EXPECT_THROW(reader.read(root.at(u"a")), StoredError);
-    reader.read(root.at(u"b"));
-    EXPECT_THROW(reader.read(root.at(u"b")), StoredError);
+    const auto& root = reader.entry(CompoundFileReader::kRootIndex).contained;
+    reader.Read(root.at(u"a"));
+    EXPECT_THROW(reader.Read(root.at(u"a")), StoredError);
+    reader.Read(root.at(u"b"));
+    EXPECT_THROW(reader.Read(root.at(u"b")), StoredError);
 }
 
 TEST(CompoundFileReader, RefusesOtherKindsOfFiles) {
     EXPECT_EQ(refusal({}), "is no compound file");
     EXPECT_EQ(refusal(Bytes(4096)), "is no compound file");
-    Bytes file = threeStreams();
-    file[sectorShiftOffset] = 10;
+    Bytes file = ThreeStreams();
+    file[kSectorShiftOffset] = 10;
     EXPECT_EQ(refusal(file), "a kind of compound file that AAF does not use");
-    file = threeStreams();
+    file = ThreeStreams();
     file.resize(512);
     EXPECT_EQ(refusal(file), "the file ends after its header");
 }
 
 TEST(CompoundFileReader, RefusesACircleAmongSiblings) {
-    Bytes file = threeStreams();
-    const std::uint32_t first = numberAt(file, entryAt(file, 0) + childOffset);
-    put(file, entryAt(file, first) + leftOffset, first);
+    Bytes file = ThreeStreams();
+    const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kChildOffset);
+    put(file, EntryAt(file, first) + kLeftOffset, first);
     EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
 }
 
 TEST(CompoundFileReader, RefusesAStorageThatContainsTheRoot) {
-    Bytes file = threeStreams();
+    Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
-        if (file[entryAt(file, i) + 66] == 1) {
-            put(file, entryAt(file, i) + childOffset, 0);
+        if (file[EntryAt(file, i) + 66] == 1) {
+            put(file, EntryAt(file, i) + kChildOffset, 0);
         }
     }
     EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
 }
 
 TEST(CompoundFileReader, RefusesAnEntryBeyondTheDirectory) {
-    Bytes file = threeStreams();
-    const std::uint32_t first = numberAt(file, entryAt(file, 0) + childOffset);
-    put(file, entryAt(file, first) + rightOffset, 5000);
+    Bytes file = ThreeStreams();
+    const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kChildOffset);
+    put(file, EntryAt(file, first) + kRightOffset, 5000);
     EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
 }
 
 TEST(CompoundFileReader, RefusesAChainThatRunsInACircle) {
-    Bytes file = threeStreams();
-    const std::uint32_t table = numberAt(file, tableListOffset);
-    const std::uint32_t directory = numberAt(file, firstDirectoryOffset);
+    Bytes file = ThreeStreams();
+    const std::uint32_t table = NumberAt(file, kTableListOffset);
+    const std::uint32_t directory = NumberAt(file, kFirstDirectoryOffset);
     put(file, (table + 1) * 512 + directory * 4, directory);
     EXPECT_EQ(refusal(file), "sector " + std::to_string(directory) + " is used twice");
 }
 
 TEST(CompoundFileReader, RefusesAStreamThatRunsOutOfTheFile) {
-    Bytes file = threeStreams();
+    Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
-        if (numberAt(file, entryAt(file, i) + sizeOffset) == 5000) {
-            put(file, entryAt(file, i) + startOffset, 4000);
+        if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 5000) {
+            put(file, EntryAt(file, i) + kStartOffset, 4000);
         }
     }
     EXPECT_EQ(refusal(file), "sector 4000 lies beyond the end of the file");
 }
 
 TEST(CompoundFileReader, RefusesAHugeClaimBeforeItTakesMemory) {
-    Bytes file = threeStreams();
+    Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
-        if (numberAt(file, entryAt(file, i) + sizeOffset) == 5000) {
-            put(file, entryAt(file, i) + sizeOffset, 0xFFFFFFF0);
+        if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 5000) {
+            put(file, EntryAt(file, i) + kSizeOffset, 0xFFFFFFF0);
         }
     }
     EXPECT_EQ(refusal(file), "a stream claims 4294967280 bytes");
-    file = threeStreams();
-    put(file, tableCountOffset, 0x7FFFFFFF);
+    file = ThreeStreams();
+    put(file, kTableCountOffset, 0x7FFFFFFF);
     EXPECT_EQ(refusal(file).find("the header counts 2147483647 table sectors"), 0u);
 }
 
 TEST(CompoundFileReader, RefusesTwoStreamsThatShareASector) {
-    Bytes file = threeStreams();
+    Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
-        if (numberAt(file, entryAt(file, i) + sizeOffset) == 10) {
-            put(file, entryAt(file, i) + sizeOffset, 5000);
-            put(file, entryAt(file, i) + startOffset, 0);
-        } else if (numberAt(file, entryAt(file, i) + sizeOffset) == 5000) {
-            put(file, entryAt(file, i) + startOffset, 0);
+        if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 10) {
+            put(file, EntryAt(file, i) + kSizeOffset, 5000);
+            put(file, EntryAt(file, i) + kStartOffset, 0);
+        } else if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 5000) {
+            put(file, EntryAt(file, i) + kStartOffset, 0);
         }
     }
     EXPECT_EQ(refusal(file), "sector 0 is used twice");
@@ -165,39 +165,39 @@ TEST(CompoundFileReader, RefusesTwoStreamsThatShareASector) {
 // no walk may go deeper with their number.
 TEST(CompoundFileReader, WalksAVeryLongChainOfSiblings) {
     constexpr std::uint32_t count = 60000;
-    constexpr std::uint32_t perSector = 4096 / directoryEntrySize;
+    constexpr std::uint32_t perSector = 4096 / kDirectoryEntrySize;
     const std::uint32_t directorySectors = (count + 1 + perSector - 1) / perSector;
     const std::uint32_t tableSectors = (directorySectors + 2 + 1023) / 1024;
     Bytes file((1 + tableSectors + directorySectors) * std::size_t{4096});
-    std::copy(std::begin(compoundMagic), std::end(compoundMagic), file.begin());
+    std::copy(std::begin(kCompoundMagic), std::end(kCompoundMagic), file.begin());
     file[28] = 0xFE;
     file[29] = 0xFF;
     file[30] = 12;
     file[32] = 6;
-    put(file, tableCountOffset, tableSectors);
-    put(file, firstDirectoryOffset, tableSectors);
-    put(file, smallLimitOffset, smallStreamLimit);
-    put(file, firstSmallTableOffset, endOfChain);
+    put(file, kTableCountOffset, tableSectors);
+    put(file, kFirstDirectoryOffset, tableSectors);
+    put(file, kSmallLimitOffset, kSmallStreamLimit);
+    put(file, kFirstSmallTableOffset, kEndOfChain);
     for (std::uint32_t i = 0; i < tableSectors; ++i) {
-        put(file, tableListOffset + 4 * i, i);
+        put(file, kTableListOffset + 4 * i, i);
     }
     for (std::uint32_t i = 0; i < directorySectors; ++i) {
         const bool last = i + 1 == directorySectors;
         put(file, 4096 + std::size_t{tableSectors + i} * 4,
-            last ? endOfChain : tableSectors + i + 1);
+            last ? kEndOfChain : tableSectors + i + 1);
     }
     for (std::uint32_t i = 0; i <= count; ++i) {
-        const std::size_t at = (tableSectors + 1) * std::size_t{4096} + i * directoryEntrySize;
+        const std::size_t at = (tableSectors + 1) * std::size_t{4096} + i * kDirectoryEntrySize;
         const std::string name = i == 0 ? "Root Entry" : std::to_string(100000 + i);
         for (std::size_t c = 0; c < name.size(); ++c) {
             file[at + 2 * c] = static_cast<std::uint8_t>(name[c]);
         }
         file[at + 64] = static_cast<std::uint8_t>(2 * name.size() + 2);
         file[at + 66] = i == 0 ? 5 : 1;
-        put(file, at + leftOffset, freeSector);
-        put(file, at + rightOffset, i == 0 || i == count ? freeSector : i + 1);
-        put(file, at + childOffset, i == 0 ? 1 : freeSector);
+        put(file, at + kLeftOffset, kFreeSector);
+        put(file, at + kRightOffset, i == 0 || i == count ? kFreeSector : i + 1);
+        put(file, at + kChildOffset, i == 0 ? 1 : kFreeSector);
     }
     CompoundFileReader reader(file);
-    EXPECT_EQ(reader.entry(CompoundFileReader::rootIndex).contained.size(), count);
+    EXPECT_EQ(reader.entry(CompoundFileReader::kRootIndex).contained.size(), count);
 }

@@ -18,7 +18,7 @@ namespace {
 
 std::string refusal(const Bytes& file) {
     try {
-        readTree(file);
+        ReadTree(file);
         return "";
     } catch (const StoredError& problem) {
         return problem.what();
@@ -26,15 +26,15 @@ std::string refusal(const Bytes& file) {
 }
 
 // A file whose root storage holds what the function puts there.
-Bytes fileWith(const std::function<void(StorageWriter&)>& fill) {
+Bytes FileWith(const std::function<void(StorageWriter&)>& fill) {
     CompoundFileWriter writer(SectorSize::Bytes512);
-    writer.root().setClass(rootClassId);
+    writer.root().SetClass(kRootClassId);
     fill(writer.root());
-    return writer.finish();
+    return writer.Finish();
 }
 
 // A properties stream with one property.
-Bytes oneProperty(std::uint16_t pid, std::uint16_t form, const Bytes& value) {
+Bytes OneProperty(std::uint16_t pid, std::uint16_t form, const Bytes& value) {
     return ByteWriter()
         .number(std::uint8_t{0x4C})
         .number(std::uint8_t{0x20})
@@ -42,7 +42,7 @@ Bytes oneProperty(std::uint16_t pid, std::uint16_t form, const Bytes& value) {
         .number(pid)
         .number(form)
         .number(static_cast<std::uint16_t>(value.size()))
-        .append(value)
+        .Append(value)
         .bytes();
 }
 
@@ -50,13 +50,13 @@ Bytes name(const std::u16string& text) {
     return ByteWriter().text(text).bytes();
 }
 
-Bytes fileWithProperties(const Bytes& properties) {
-    return fileWith([&](StorageWriter& root) { root.stream(u"properties", properties); });
+Bytes FileWithProperties(const Bytes& properties) {
+    return FileWith([&](StorageWriter& root) { root.stream(u"properties", properties); });
 }
 
-Bytes fileWithIndex(std::uint16_t form, const Bytes& index) {
-    return fileWith([&](StorageWriter& root) {
-        root.stream(u"properties", oneProperty(0x1901, form, name(u"Mobs-1901")));
+Bytes FileWithIndex(std::uint16_t form, const Bytes& index) {
+    return FileWith([&](StorageWriter& root) {
+        root.stream(u"properties", OneProperty(0x1901, form, name(u"Mobs-1901")));
         root.stream(u"Mobs-1901 index", index);
     });
 }
@@ -65,13 +65,13 @@ Bytes fileWithIndex(std::uint16_t form, const Bytes& index) {
 
 TEST(DamagedFile, IsRefusedHoweverItIsCutShort) {
     for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
-        const Bytes file = writeTree(sample::everyForm(), size);
+        const Bytes file = WriteTree(sample::EveryForm(), size);
         for (std::size_t length = 0; length < file.size(); length += 64) {
             const Bytes cut(file.begin(), file.begin() + static_cast<std::ptrdiff_t>(length));
             // A last sector that nothing uses may be missing; all else is felt.
             const std::string why = refusal(cut);
             if (why.empty()) {
-                EXPECT_EQ(readTree(cut), readTree(file)) << length;
+                EXPECT_EQ(ReadTree(cut), ReadTree(file)) << length;
                 EXPECT_GE(length, file.size() - static_cast<std::size_t>(size)) << length;
             }
         }
@@ -79,7 +79,7 @@ TEST(DamagedFile, IsRefusedHoweverItIsCutShort) {
 }
 
 TEST(DamagedFile, WithAFlippedByteIsReadOrRefusedButNeverHarms) {
-    const Bytes file = writeTree(sample::everyForm(), SectorSize::Bytes512);
+    const Bytes file = WriteTree(sample::EveryForm(), SectorSize::Bytes512);
     std::size_t refused = 0;
     for (std::size_t at = 0; at < file.size(); ++at) {
         Bytes damaged = file;
@@ -94,7 +94,7 @@ TEST(DamagedFile, WithSeveralRandomBytesIsReadOrRefusedButNeverHarms) {
     const unsigned seed = std::random_device()();
     SCOPED_TRACE("seed " + std::to_string(seed));
     std::mt19937 random(seed);
-    const Bytes file = writeTree(sample::everyForm(), SectorSize::Bytes512);
+    const Bytes file = WriteTree(sample::EveryForm(), SectorSize::Bytes512);
     std::size_t refused = 0;
     for (int round = 0; round < 2000; ++round) {
         Bytes damaged = file;
@@ -107,42 +107,42 @@ TEST(DamagedFile, WithSeveralRandomBytesIsReadOrRefusedButNeverHarms) {
 }
 
 TEST(DamagedFile, WithoutPropertiesIsRefused) {
-    EXPECT_EQ(refusal(fileWith([](StorageWriter&) {})), "\"properties\" is missing");
+    EXPECT_EQ(refusal(FileWith([](StorageWriter&) {})), "\"properties\" is missing");
 }
 
 TEST(DamagedFile, WithAPropertyTableThatEndsEarlyIsRefused) {
-    EXPECT_EQ(refusal(fileWithProperties({0x4C})), "1 bytes wanted, 0 left");
-    EXPECT_EQ(refusal(fileWithProperties({0x4C, 0x20, 0xFF, 0xFF})), "393210 bytes wanted, 0 left");
-    Bytes properties = oneProperty(0x4402, 0x82, {1, 2, 3});
+    EXPECT_EQ(refusal(FileWithProperties({0x4C})), "1 bytes wanted, 0 left");
+    EXPECT_EQ(refusal(FileWithProperties({0x4C, 0x20, 0xFF, 0xFF})), "393210 bytes wanted, 0 left");
+    Bytes properties = OneProperty(0x4402, 0x82, {1, 2, 3});
     properties.pop_back();
-    EXPECT_EQ(refusal(fileWithProperties(properties)), "property 4402: 3 bytes wanted, 2 left");
+    EXPECT_EQ(refusal(FileWithProperties(properties)), "property 4402: 3 bytes wanted, 2 left");
 }
 
 TEST(DamagedFile, OfTheOtherByteOrderIsRefused) {
-    EXPECT_EQ(refusal(fileWithProperties({0x42, 0x20, 0, 0})),
+    EXPECT_EQ(refusal(FileWithProperties({0x42, 0x20, 0, 0})),
               "big-endian files are not supported");
-    EXPECT_EQ(refusal(fileWithProperties({0x41, 0x20, 0, 0})), "unknown byte order");
+    EXPECT_EQ(refusal(FileWithProperties({0x41, 0x20, 0, 0})), "unknown byte order");
 }
 
 TEST(DamagedFile, WithAPropertyTwiceIsRefused) {
     const Bytes twice = {0x4C, 0x20, 2, 0, 2, 0x44, 0x82, 0, 1, 0, 2, 0x44, 0x82, 0, 1, 0, 7, 7};
-    EXPECT_EQ(refusal(fileWithProperties(twice)), "property 4402: occurs twice");
+    EXPECT_EQ(refusal(FileWithProperties(twice)), "property 4402: occurs twice");
 }
 
 TEST(DamagedFile, WithAPropertyOfNoBytesIsReadWithoutIt) {
-    const StoredObject tree = readTree(fileWithProperties(oneProperty(0x4402, 0x82, {})));
+    const StoredObject tree = ReadTree(FileWithProperties(OneProperty(0x4402, 0x82, {})));
     EXPECT_TRUE(tree.properties.empty());
 }
 
 TEST(DamagedFile, WithAnObjectMissingIsRefused) {
-    EXPECT_EQ(refusal(fileWithProperties(oneProperty(2, 0x22, name(u"Header-2")))),
+    EXPECT_EQ(refusal(FileWithProperties(OneProperty(2, 0x22, name(u"Header-2")))),
               "property 0002: \"Header-2\" is missing");
 }
 
 TEST(DamagedFile, WithANameThatDoesNotEndIsRefused) {
-    EXPECT_EQ(refusal(fileWithProperties(oneProperty(2, 0x22, {'H', 0}))),
+    EXPECT_EQ(refusal(FileWithProperties(OneProperty(2, 0x22, {'H', 0}))),
               "property 0002: a name that does not end with its terminator");
-    EXPECT_EQ(refusal(fileWithProperties(oneProperty(2, 0x22, {'H', 0, 0}))),
+    EXPECT_EQ(refusal(FileWithProperties(OneProperty(2, 0x22, {'H', 0, 0}))),
               "property 0002: a name of 3 bytes");
 }
 
@@ -153,26 +153,26 @@ TEST(DamagedFile, WithOneObjectInTwoPlacesIsRefused) {
                       .number(std::uint32_t{0})
                       .number(std::uint32_t{0})
                       .bytes();
-    const Bytes file = fileWith([&](StorageWriter& root) {
-        root.stream(u"properties", oneProperty(0x4403, 0x32, name(u"Slots-4403")));
+    const Bytes file = FileWith([&](StorageWriter& root) {
+        root.stream(u"properties", OneProperty(0x4403, 0x32, name(u"Slots-4403")));
         root.stream(u"Slots-4403 index", index);
         StorageWriter slot = root.storage(u"Slots-4403{0}");
         slot.stream(u"properties", {0x4C, 0x20, 0, 0});
-        slot.close();
+        slot.Close();
     });
     EXPECT_EQ(refusal(file), "property 4403: \"Slots-4403{0}\" is referred to twice");
 }
 
 TEST(DamagedFile, WithAnIndexThatClaimsTooMuchIsRefused) {
     Bytes vector(12, 0xFF);
-    EXPECT_EQ(refusal(fileWithIndex(0x32, vector)),
+    EXPECT_EQ(refusal(FileWithIndex(0x32, vector)),
               "property 1901: the index counts 4294967295 elements, 0 bytes left");
     Bytes set(12, 0xFF);
     set.insert(set.end(), {0x01, 0x44, 32, 0, 0});
-    EXPECT_EQ(refusal(fileWithIndex(0x3A, set)),
+    EXPECT_EQ(refusal(FileWithIndex(0x3A, set)),
               "property 1901: the index counts 4294967295 elements, 2 bytes left");
     set[14] = 0;
-    EXPECT_EQ(refusal(fileWithIndex(0x3A, set)), "property 1901: a key of 0 bytes");
+    EXPECT_EQ(refusal(FileWithIndex(0x3A, set)), "property 1901: a key of 0 bytes");
 }
 
 TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
@@ -180,15 +180,15 @@ TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
     index.number(std::uint32_t{2}).number(std::uint64_t{0}).number(std::uint16_t{5});
     index.number(std::uint8_t{16});
     for (std::uint32_t i = 0; i < 2; ++i) {
-        index.number(i).number(std::uint32_t{1}).append(Bytes(16, 7));
+        index.number(i).number(std::uint32_t{1}).Append(Bytes(16, 7));
     }
-    const Bytes file = fileWith([&](StorageWriter& root) {
-        root.stream(u"properties", oneProperty(0x1901, 0x3A, name(u"Mobs-1901")));
+    const Bytes file = FileWith([&](StorageWriter& root) {
+        root.stream(u"properties", OneProperty(0x1901, 0x3A, name(u"Mobs-1901")));
         root.stream(u"Mobs-1901 index", index.bytes());
         for (const char16_t* element : {u"Mobs-1901{0}", u"Mobs-1901{1}"}) {
             StorageWriter mob = root.storage(element);
             mob.stream(u"properties", {0x4C, 0x20, 0, 0});
-            mob.close();
+            mob.Close();
         }
     });
     EXPECT_EQ(refusal(file), "property 1901: a set has a key twice");
@@ -197,15 +197,15 @@ TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
 TEST(DamagedFile, WithAWeakReferenceBeyondTheTableIsRefused) {
     Bytes reference = {7, 0, 0x01, 0x1B, 16};
     reference.resize(21);
-    EXPECT_EQ(refusal(fileWithProperties(oneProperty(0x0201, 0x02, reference))),
+    EXPECT_EQ(refusal(FileWithProperties(OneProperty(0x0201, 0x02, reference))),
               "property 0201: a weak reference has tag 7, the file has 0 paths");
-    EXPECT_EQ(refusal(fileWithProperties(oneProperty(0x0201, 0x02, {7, 0}))),
+    EXPECT_EQ(refusal(FileWithProperties(OneProperty(0x0201, 0x02, {7, 0}))),
               "property 0201: 2 bytes wanted, 0 left");
 }
 
 TEST(DamagedFile, WithATableOfWeakReferencesThatLiesIsRefused) {
     const auto withTable = [](const Bytes& table) {
-        return fileWith([&](StorageWriter& root) {
+        return FileWith([&](StorageWriter& root) {
             root.stream(u"properties", {0x4C, 0x20, 0, 0});
             root.stream(u"referenced properties", table);
         });
@@ -219,19 +219,19 @@ TEST(DamagedFile, WithATableOfWeakReferencesThatLiesIsRefused) {
 
 TEST(DamagedFile, NestedWithoutEndIsRefused) {
     std::function<void(StorageWriter&, int)> nest = [&](StorageWriter& storage, int depth) {
-        storage.stream(u"properties", oneProperty(0x4803, 0x22, name(u"Segment-4803")));
+        storage.stream(u"properties", OneProperty(0x4803, 0x22, name(u"Segment-4803")));
         if (depth > 0) {
             StorageWriter inner = storage.storage(u"Segment-4803");
             nest(inner, depth - 1);
-            inner.close();
+            inner.Close();
         }
     };
-    const Bytes file = fileWith([&](StorageWriter& root) { nest(root, maximumDepth + 50); });
+    const Bytes file = FileWith([&](StorageWriter& root) { nest(root, kMaximumDepth + 50); });
     EXPECT_NE(refusal(file).find("objects are nested too deep"), std::string::npos);
 }
 
 TEST(DamagedFile, StoragesThatNobodyNamesArePassedOver) {
-    const Bytes file = fileWith([&](StorageWriter& root) {
+    const Bytes file = FileWith([&](StorageWriter& root) {
         root.stream(u"properties", {0x4C, 0x20, 0, 0});
         root.stream(u"something else", {1, 2, 3});
     });

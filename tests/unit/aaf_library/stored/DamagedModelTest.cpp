@@ -20,15 +20,15 @@ using namespace aaf::stored;
 
 namespace {
 
-StoredObject sampleTree() {
-    const sample::SampleModel sample = sample::wholeModel();
-    return treeOfModel(*sample.model, *sample.header);
+StoredObject SampleTree() {
+    const sample::SampleModel sample = sample::WholeModel();
+    return TreeOfModel(*sample.model, *sample.header);
 }
 
 std::string refusal(const StoredObject& tree) {
-    const RefPtr<Model> model = sample::newModel();
+    const RefPtr<Model> model = sample::NewModel();
     try {
-        readModel(tree, *model);
+        ReadModel(tree, *model);
         return "";
     } catch (const StoredError& problem) {
         return problem.what();
@@ -53,88 +53,88 @@ StoredProperty& mobs(StoredObject& tree) {
                     prop::ContentStorage_Mobs.pid);
 }
 
-StoredObject& firstSlot(StoredObject& tree) {
+StoredObject& FirstSlot(StoredObject& tree) {
     return property(mobs(tree).objects.front(), prop::Mob_Slots.pid).objects.front();
 }
 
 StoredProperty& types(StoredObject& tree) {
-    return property(property(tree, 1).objects.front(), meta::typeDefinitions);
+    return property(property(tree, 1).objects.front(), meta::kTypeDefinitions);
 }
 
 }  // namespace
 
 TEST(DamagedModel, TheSampleItselfIsRead) {
-    EXPECT_EQ(refusal(sampleTree()), "");
+    EXPECT_EQ(refusal(SampleTree()), "");
 }
 
 TEST(DamagedModel, WithoutItsMainPartsIsRefused) {
     EXPECT_EQ(refusal(StoredObject()), "has no meta-dictionary");
-    StoredObject tree = sampleTree();
+    StoredObject tree = SampleTree();
     property(tree, 2).pid = 7;
     EXPECT_EQ(refusal(tree), "has no header");
-    tree = sampleTree();
+    tree = SampleTree();
     property(header(tree), prop::Header_Dictionary.pid).pid = 0x7001;
     EXPECT_EQ(refusal(tree), "has no dictionary");
-    tree = sampleTree();
+    tree = SampleTree();
     property(header(tree), prop::Header_Content.pid).pid = 0x7001;
     EXPECT_EQ(refusal(tree), "has no content");
 }
 
 TEST(DamagedModel, WithAnObjectOfAnUnknownClassIsRefused) {
-    StoredObject tree = sampleTree();
-    firstSlot(tree).classId[0] ^= 0xFF;
+    StoredObject tree = SampleTree();
+    FirstSlot(tree).classId[0] ^= 0xFF;
     EXPECT_EQ(refusal(tree), "Content: Mobs: Slots: an object of a class that is not defined");
 }
 
 TEST(DamagedModel, WithAnObjectInThePlaceOfAnotherKindIsRefused) {
-    StoredObject tree = sampleTree();
-    firstSlot(tree).classId = storedAuid(AUID_AAFFiller);
+    StoredObject tree = SampleTree();
+    FirstSlot(tree).classId = AuidOf(AUID_AAFFiller);
     EXPECT_EQ(refusal(tree),
               "Content: Mobs: Slots: an object of the class Filler in a place for others");
-    tree = sampleTree();
-    header(tree).classId = storedAuid(AUID_AAFFiller);
+    tree = SampleTree();
+    header(tree).classId = AuidOf(AUID_AAFFiller);
     EXPECT_EQ(refusal(tree), "an object of the class Filler in a place for others");
 }
 
 TEST(DamagedModel, WithADefinitionOfTheMetaModelAmongTheObjectsIsRefused) {
-    StoredObject tree = sampleTree();
-    firstSlot(tree).classId = storedAuid(ncfGuid("0D010101-0201-0000-060E-2B3402060101"));
+    StoredObject tree = SampleTree();
+    FirstSlot(tree).classId = AuidOf(ncfGuid("0D010101-0201-0000-060E-2B3402060101"));
     EXPECT_NE(refusal(tree), "");
 }
 
 TEST(DamagedModel, WithAValueOfTheWrongSizeIsRefused) {
-    StoredObject tree = sampleTree();
-    property(firstSlot(tree), prop::TimelineMobSlot_EditRate.pid).bytes.pop_back();
+    StoredObject tree = SampleTree();
+    property(FirstSlot(tree), prop::TimelineMobSlot_EditRate.pid).bytes.pop_back();
     EXPECT_EQ(refusal(tree), "Content: Mobs: Slots: EditRate: 7 bytes are no value of its type");
-    tree = sampleTree();
-    property(firstSlot(tree), prop::MobSlot_SlotName.pid).bytes.pop_back();
+    tree = SampleTree();
+    property(FirstSlot(tree), prop::MobSlot_SlotName.pid).bytes.pop_back();
     EXPECT_NE(refusal(tree).find("SlotName: "), std::string::npos);
 }
 
 TEST(DamagedModel, WithAValueInAnotherFormIsRefused) {
-    StoredObject tree = sampleTree();
-    property(firstSlot(tree), prop::MobSlot_SlotName.pid).form = StoredForm::Stream;
+    StoredObject tree = SampleTree();
+    property(FirstSlot(tree), prop::MobSlot_SlotName.pid).form = StoredForm::Stream;
     EXPECT_EQ(refusal(tree),
               "Content: Mobs: Slots: SlotName: is stored in another form than its type has");
 }
 
 TEST(DamagedModel, WithAKeyThatDiffersFromItsElementIsRefused) {
-    StoredObject tree = sampleTree();
+    StoredObject tree = SampleTree();
     mobs(tree).keys.front()[31] ^= 0xFF;
     EXPECT_EQ(refusal(tree), "Content: Mobs: an element whose key differs from that in the index");
 }
 
 TEST(DamagedModel, AValueThatNothingDescribesIsPassedOver) {
-    StoredObject tree = sampleTree();
+    StoredObject tree = SampleTree();
     StoredProperty odd;
     odd.pid = 0x9000;
     odd.bytes = {1, 2, 3};
-    firstSlot(tree).properties.push_back(odd);
+    FirstSlot(tree).properties.push_back(odd);
     EXPECT_EQ(refusal(tree), "");
 }
 
 TEST(DamagedModel, TypesThatAreMadeOfThemselvesAreLeftOut) {
-    StoredObject tree = sampleTree();
+    StoredObject tree = SampleTree();
     MetaRecords records;
     for (std::uint8_t i = 0; i < 3; ++i) {
         TypeFacts type;
@@ -146,8 +146,8 @@ TEST(DamagedModel, TypesThatAreMadeOfThemselvesAreLeftOut) {
         type.target.Data4[7] = static_cast<std::uint8_t>((i + 1) % 3);
         records.types.push_back(type);
     }
-    const StoredObject circle = storedMetaDictionary(records);
-    const StoredProperty& added = *circle.find(meta::typeDefinitions);
+    const StoredObject circle = StoredMetaDictionary(records);
+    const StoredProperty& added = *circle.Find(meta::kTypeDefinitions);
     StoredProperty& set = types(tree);
     set.objects.insert(set.objects.end(), added.objects.begin(), added.objects.end());
     set.keys.insert(set.keys.end(), added.keys.begin(), added.keys.end());
@@ -155,7 +155,7 @@ TEST(DamagedModel, TypesThatAreMadeOfThemselvesAreLeftOut) {
 }
 
 TEST(DamagedModel, ALongLineOfTypesIsRefused) {
-    StoredObject tree = sampleTree();
+    StoredObject tree = SampleTree();
     MetaRecords records;
     for (std::uint32_t i = 0; i < 5000; ++i) {
         TypeFacts type;
@@ -167,8 +167,8 @@ TEST(DamagedModel, ALongLineOfTypesIsRefused) {
         ++type.target.Data1;
         records.types.push_back(type);
     }
-    const StoredObject line = storedMetaDictionary(records);
-    const StoredProperty& added = *line.find(meta::typeDefinitions);
+    const StoredObject line = StoredMetaDictionary(records);
+    const StoredProperty& added = *line.Find(meta::kTypeDefinitions);
     StoredProperty& set = types(tree);
     set.objects.insert(set.objects.end(), added.objects.begin(), added.objects.end());
     set.keys.insert(set.keys.end(), added.keys.begin(), added.keys.end());
@@ -184,13 +184,13 @@ TEST(DamagedModel, AnArrayTypeLargerThanAnyValueIsLeftOut) {
     type.target = ncfGuid("01010300-0000-0000-060E-2B3401040101");
     type.size = 0xFFFFFFFF;
     records.types.push_back(type);
-    StoredObject tree = sampleTree();
-    const StoredObject huge = storedMetaDictionary(records);
+    StoredObject tree = SampleTree();
+    const StoredObject huge = StoredMetaDictionary(records);
     StoredProperty& set = types(tree);
-    set.objects.push_back(huge.find(meta::typeDefinitions)->objects.front());
-    set.keys.push_back(huge.find(meta::typeDefinitions)->keys.front());
-    const RefPtr<Model> model = sample::newModel();
-    readModel(tree, *model);
+    set.objects.push_back(huge.Find(meta::kTypeDefinitions)->objects.front());
+    set.keys.push_back(huge.Find(meta::kTypeDefinitions)->keys.front());
+    const RefPtr<Model> model = sample::NewModel();
+    ReadModel(tree, *model);
     EXPECT_EQ(model->FindType(type.id), nullptr);
 }
 
@@ -199,7 +199,7 @@ TEST(DamagedModel, WithARandomChangeIsReadOrRefusedButNeverHarms) {
     const unsigned seed = std::random_device()();
     SCOPED_TRACE("seed " + std::to_string(seed));
     std::mt19937 random(seed);
-    const Bytes file = writeTree(sampleTree(), SectorSize::Bytes512);
+    const Bytes file = WriteTree(SampleTree(), SectorSize::Bytes512);
     int refused = 0;
     for (int round = 0; round < 300; ++round) {
         Bytes damaged = file;
@@ -207,7 +207,7 @@ TEST(DamagedModel, WithARandomChangeIsReadOrRefusedButNeverHarms) {
             damaged[512 + random() % (damaged.size() - 512)] = static_cast<std::uint8_t>(random());
         }
         try {
-            refused += refusal(readTree(damaged)).empty() ? 0 : 1;
+            refused += refusal(ReadTree(damaged)).empty() ? 0 : 1;
         } catch (const StoredError&) {
             ++refused;
         }

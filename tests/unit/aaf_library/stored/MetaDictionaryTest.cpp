@@ -16,30 +16,28 @@ using namespace aaf::stored;
 
 namespace {
 
-constexpr GUID quadId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E01");
-constexpr GUID rationalId = ncfGuid("03010100-0000-0000-060E-2B3401040101");
+constexpr GUID kQuadId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E01");
+constexpr GUID kRationalId = ncfGuid("03010100-0000-0000-060E-2B3401040101");
 
 TypeFacts quad() {
     TypeFacts type;
-    type.id = quadId;
+    type.id = kQuadId;
     type.name = L"ExampleQuad";
     type.kind = TypeKind::Record;
     for (const wchar_t* name : {L"Left", L"Top", L"Right", L"Bottom"}) {
-        type.members.push_back({name, rationalId, 0});
+        type.members.push_back({name, kRationalId, 0});
     }
     return type;
 }
 
-MetaRecords oneType(TypeFacts type) {
+MetaRecords OneType(TypeFacts type) {
     MetaRecords records;
     records.types.push_back(std::move(type));
     return records;
 }
 
-void sortById(MetaRecords& records) {
-    const auto byId = [](const auto& a, const auto& b) {
-        return storedAuid(a.id) < storedAuid(b.id);
-    };
+void SortById(MetaRecords& records) {
+    const auto byId = [](const auto& a, const auto& b) { return AuidOf(a.id) < AuidOf(b.id); };
     std::sort(records.classes.begin(), records.classes.end(), byId);
     std::sort(records.types.begin(), records.types.end(), byId);
     for (MetaClass& entry : records.classes) {
@@ -49,14 +47,14 @@ void sortById(MetaRecords& records) {
 
 std::string refusal(const StoredObject& dictionary) {
     try {
-        readMetaDictionary(dictionary);
+        ReadMetaDictionary(dictionary);
         return "";
     } catch (const StoredError& problem) {
         return problem.what();
     }
 }
 
-StoredProperty& firstType(StoredObject& dictionary, std::uint16_t pid) {
+StoredProperty& FirstType(StoredObject& dictionary, std::uint16_t pid) {
     for (StoredProperty& property : dictionary.properties[1].objects[0].properties) {
         if (property.pid == pid) {
             return property;
@@ -68,14 +66,14 @@ StoredProperty& firstType(StoredObject& dictionary, std::uint16_t pid) {
 }  // namespace
 
 TEST(MetaDictionary, EveryBuiltInDefinitionComesBackFromTheFile) {
-    MetaRecords wanted = sample::builtInRecords();
-    const Bytes file = writeTree(
-        sample::rootWith(sample::reference(1, u"MetaDictionary", storedMetaDictionary(wanted))),
+    MetaRecords wanted = sample::BuiltInRecords();
+    const Bytes file = WriteTree(
+        sample::RootWith(sample::reference(1, u"MetaDictionary", StoredMetaDictionary(wanted))),
         SectorSize::Bytes4096);
-    const StoredObject root = readTree(file);
-    MetaRecords read = readMetaDictionary(root.properties.front().objects.front());
-    sortById(wanted);
-    sortById(read);
+    const StoredObject root = ReadTree(file);
+    MetaRecords read = ReadMetaDictionary(root.properties.front().objects.front());
+    SortById(wanted);
+    SortById(read);
 
     ASSERT_EQ(read.classes.size(), wanted.classes.size());
     for (std::size_t i = 0; i < wanted.classes.size(); ++i) {
@@ -115,74 +113,74 @@ TEST(MetaDictionary, EveryBuiltInDefinitionComesBackFromTheFile) {
 }
 
 TEST(MetaDictionary, LaysOutARecordTypeByteForByte) {
-    const Bytes file = writeTree(sample::rootWith(sample::reference(
-                                     1, u"MetaDictionary", storedMetaDictionary(oneType(quad())))),
+    const Bytes file = WriteTree(sample::RootWith(sample::reference(
+                                     1, u"MetaDictionary", StoredMetaDictionary(OneType(quad())))),
                                  SectorSize::Bytes512);
     CompoundFileReader reader(file);
     const auto inside = [&](std::uint32_t storage, const char16_t* name) {
         return reader.entry(storage).contained.at(name);
     };
-    const std::uint32_t definition =
-        inside(inside(CompoundFileReader::rootIndex, u"MetaDictionary-1"), u"TypeDefinitions-4{0}");
-    EXPECT_EQ(guidOf(reader.entry(definition).classId),
+    const std::uint32_t definition = inside(
+        inside(CompoundFileReader::kRootIndex, u"MetaDictionary-1"), u"TypeDefinitions-4{0}");
+    EXPECT_EQ(GuidOf(reader.entry(definition).classId),
               ncfGuid("0D010101-020D-0000-060E-2B3402060101"));
 
     const Bytes head = {0x4C, 0x20, 4,    0, 5,    0,    0x82, 0,    0x10, 0,    6,    0,
                         0x82, 0,    0x18, 0, 0x1C, 0,    0x12, 0,    0x1E, 0,    0x1D, 0,
                         0x82, 0,    0x2C, 0, 0x10, 0x1F, 0x2C, 0x9D, 0x5A, 0x4F, 0x77, 0x4C};
-    const Bytes properties = reader.read(inside(definition, u"properties"));
+    const Bytes properties = reader.Read(inside(definition, u"properties"));
     ASSERT_EQ(properties.size(), 4u + 24 + 16 + 24 + 30 + 44);
     EXPECT_TRUE(std::equal(head.begin(), head.end(), properties.begin()));
 
     Bytes index = {4, 0, 0, 0, 0, 0, 5, 0, 16};
     for (int i = 0; i < 4; ++i) {
-        const Bytes key = sample::bytes(storedAuid(rationalId));
+        const Bytes key = sample::bytes(AuidOf(kRationalId));
         index.insert(index.end(), key.begin(), key.end());
     }
-    EXPECT_EQ(reader.read(inside(definition, u"MemberTypes-1c index")), index);
+    EXPECT_EQ(reader.Read(inside(definition, u"MemberTypes-1c index")), index);
 }
 
 TEST(MetaDictionary, IdsAreStoredWithTheirNumbersTurnedRound) {
     const GUID id = ncfGuid("0D010101-0201-2F00-060E-2B3402060101");
     const StoredAuid stored = {1, 1, 1, 0x0D, 1, 2, 0, 0x2F, 6, 0x0E, 0x2B, 0x34, 2, 6, 1, 1};
-    EXPECT_EQ(storedAuid(id), stored);
-    EXPECT_EQ(guidOf(stored), id);
-    EXPECT_THROW(guidOf(Bytes(15)), StoredError);
+    EXPECT_EQ(AuidOf(id), stored);
+    EXPECT_EQ(GuidOf(stored), id);
+    EXPECT_THROW(GuidOf(Bytes(15)), StoredError);
 }
 
 TEST(MetaDictionary, DefinitionsOfAnUnknownKindArePassedOver) {
-    StoredObject dictionary = storedMetaDictionary(oneType(quad()));
+    StoredObject dictionary = StoredMetaDictionary(OneType(quad()));
     dictionary.properties[1].objects[0].classId = sample::auid(0x77);
-    EXPECT_TRUE(readMetaDictionary(dictionary).types.empty());
+    EXPECT_TRUE(ReadMetaDictionary(dictionary).types.empty());
 }
 
 TEST(MetaDictionary, ADefinitionWithoutNameOrIdIsRefused) {
-    StoredObject dictionary = storedMetaDictionary(oneType(quad()));
-    firstType(dictionary, meta::name).pid = 0x7000;
+    StoredObject dictionary = StoredMetaDictionary(OneType(quad()));
+    FirstType(dictionary, meta::kName).pid = 0x7000;
     EXPECT_EQ(refusal(dictionary), "meta-dictionary: property 0006 is missing");
-    dictionary = storedMetaDictionary(oneType(quad()));
-    firstType(dictionary, meta::identification).bytes.pop_back();
+    dictionary = StoredMetaDictionary(OneType(quad()));
+    FirstType(dictionary, meta::kIdentification).bytes.pop_back();
     EXPECT_EQ(refusal(dictionary), "meta-dictionary: an id of 15 bytes");
 }
 
 TEST(MetaDictionary, NamesAndMembersThatDoNotPairAreRefused) {
-    StoredObject dictionary = storedMetaDictionary(oneType(quad()));
-    firstType(dictionary, meta::recordMemberTypes).keys.pop_back();
+    StoredObject dictionary = StoredMetaDictionary(OneType(quad()));
+    FirstType(dictionary, meta::kRecordMemberTypes).keys.pop_back();
     EXPECT_EQ(refusal(dictionary), "meta-dictionary: 4 names for 3 members");
-    dictionary = storedMetaDictionary(oneType(quad()));
-    Bytes& names = firstType(dictionary, meta::recordMemberNames).bytes;
+    dictionary = StoredMetaDictionary(OneType(quad()));
+    Bytes& names = FirstType(dictionary, meta::kRecordMemberNames).bytes;
     names.resize(names.size() - 2);
     EXPECT_EQ(refusal(dictionary), "meta-dictionary: property 001d ends within a name");
 }
 
 TEST(MetaDictionary, AValueOfTheWrongSizeIsRefused) {
     TypeFacts type;
-    type.id = quadId;
+    type.id = kQuadId;
     type.name = L"Odd";
     type.kind = TypeKind::FixedArray;
     type.size = 3;
-    StoredObject dictionary = storedMetaDictionary(oneType(type));
-    firstType(dictionary, meta::fixedArrayCount).bytes.pop_back();
+    StoredObject dictionary = StoredMetaDictionary(OneType(type));
+    FirstType(dictionary, meta::kFixedArrayCount).bytes.pop_back();
     EXPECT_EQ(refusal(dictionary), "meta-dictionary: 4 bytes wanted, 3 left");
 }
 

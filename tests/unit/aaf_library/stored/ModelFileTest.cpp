@@ -29,19 +29,19 @@ namespace fs = std::filesystem;
 
 namespace {
 
-Bytes bytesOf(const sample::SampleModel& sample, SectorSize size = SectorSize::Bytes512) {
-    return writeTree(treeOfModel(*sample.model, *sample.header), size);
+Bytes BytesOf(const sample::SampleModel& sample, SectorSize size = SectorSize::Bytes512) {
+    return WriteTree(TreeOfModel(*sample.model, *sample.header), size);
 }
 
 sample::SampleModel reread(const Bytes& file) {
     sample::SampleModel sample;
-    sample.model = sample::newModel();
-    sample.header = readModel(readTree(file), *sample.model);
+    sample.model = sample::NewModel();
+    sample.header = ReadModel(ReadTree(file), *sample.model);
     return sample;
 }
 
 const StoredObject& child(const StoredObject& object, std::uint16_t pid, std::size_t index = 0) {
-    const StoredProperty* property = object.find(pid);
+    const StoredProperty* property = object.Find(pid);
     if (property == nullptr || property->objects.size() <= index) {
         throw std::logic_error("no such object");
     }
@@ -50,16 +50,16 @@ const StoredObject& child(const StoredObject& object, std::uint16_t pid, std::si
 
 std::string refusal(const sample::SampleModel& sample) {
     try {
-        treeOfModel(*sample.model, *sample.header);
+        TreeOfModel(*sample.model, *sample.header);
         return "";
     } catch (const StoredError& problem) {
         return problem.what();
     }
 }
 
-std::set<std::wstring> storedClasses(const StoredObject& root) {
+std::set<std::wstring> StoredClasses(const StoredObject& root) {
     std::set<std::wstring> names;
-    for (const MetaClass& entry : readMetaDictionary(child(root, 1)).classes) {
+    for (const MetaClass& entry : ReadMetaDictionary(child(root, 1)).classes) {
         names.insert(entry.name);
     }
     return names;
@@ -68,21 +68,21 @@ std::set<std::wstring> storedClasses(const StoredObject& root) {
 }  // namespace
 
 TEST(ModelFile, EverythingComesBackFromTheFile) {
-    const sample::SampleModel sample = sample::wholeModel();
-    const sample::SampleModel read = reread(bytesOf(sample));
-    EXPECT_EQ(treeOfModel(*read.model, *read.header), treeOfModel(*sample.model, *sample.header));
+    const sample::SampleModel sample = sample::WholeModel();
+    const sample::SampleModel read = reread(BytesOf(sample));
+    EXPECT_EQ(TreeOfModel(*read.model, *read.header), TreeOfModel(*sample.model, *sample.header));
 }
 
 TEST(ModelFile, TheSameContentGivesTheSameBytes) {
-    const sample::SampleModel sample = sample::wholeModel();
-    const Bytes first = bytesOf(sample);
-    EXPECT_EQ(bytesOf(sample), first);
-    EXPECT_EQ(bytesOf(sample::wholeModel()), first);
-    EXPECT_EQ(bytesOf(reread(first)), first);
+    const sample::SampleModel sample = sample::WholeModel();
+    const Bytes first = BytesOf(sample);
+    EXPECT_EQ(BytesOf(sample), first);
+    EXPECT_EQ(BytesOf(sample::WholeModel()), first);
+    EXPECT_EQ(BytesOf(reread(first)), first);
 }
 
 TEST(ModelFile, ValuesCanBeReadAfterwards) {
-    const sample::SampleModel read = reread(bytesOf(sample::wholeModel(), SectorSize::Bytes4096));
+    const sample::SampleModel read = reread(BytesOf(sample::WholeModel(), SectorSize::Bytes4096));
     ASSERT_EQ(read.header->ObjectAt(prop::Header_Content)->CountObjects(prop::ContentStorage_Mobs),
               3u);
     Object& file = sample::mob(*read.header, 0);
@@ -112,14 +112,14 @@ TEST(ModelFile, ValuesCanBeReadAfterwards) {
 }
 
 TEST(ModelFile, ExtensionsAreKnownAndReadableAfterwards) {
-    const sample::SampleModel read = reread(bytesOf(sample::wholeModel()));
-    auto* quad = dynamic_cast<TypeRecord*>(read.model->FindType(sample::quadTypeId));
+    const sample::SampleModel read = reread(BytesOf(sample::WholeModel()));
+    auto* quad = dynamic_cast<TypeRecord*>(read.model->FindType(sample::kQuadTypeId));
     ASSERT_NE(quad, nullptr);
     ASSERT_EQ(quad->members().size(), 4u);
     EXPECT_EQ(quad->members()[3].name, L"Bottom");
     EXPECT_EQ(quad->StoredSize(), 32u);
 
-    PropertyDefinition* area = read.model->FindProperty(sample::quadPropertyId);
+    PropertyDefinition* area = read.model->FindProperty(sample::kQuadPropertyId);
     ASSERT_NE(area, nullptr);
     EXPECT_TRUE(area->IsOptional());
     EXPECT_EQ(area->owner().id(), AUID_AAFDigitalImageDescriptor);
@@ -130,19 +130,19 @@ TEST(ModelFile, ExtensionsAreKnownAndReadableAfterwards) {
     EXPECT_EQ(value->bytes()[16], 128);
 
     Object* own = descriptor->ObjectAt(prop::EssenceDescriptor_Locator, 1);
-    EXPECT_EQ(own->classId(), sample::ownClassId);
+    EXPECT_EQ(own->classId(), sample::kOwnClassId);
     EXPECT_EQ(own->classDefinition().parent()->id(), AUID_AAFLocator);
-    PropertyDefinition* place = read.model->FindProperty(sample::ownPropertyId);
+    PropertyDefinition* place = read.model->FindProperty(sample::kOwnPropertyId);
     ASSERT_NE(place, nullptr);
     EXPECT_EQ(own->FindValue(place->key())->bytes(), Bytes(24, 3));
-    EXPECT_NE(read.model->FindTarget(AUID_AAFContainerDef, sample::ownDefinitionId), nullptr);
+    EXPECT_NE(read.model->FindTarget(AUID_AAFContainerDef, sample::kOwnDefinitionId), nullptr);
 }
 
 // Another writer numbers its extensions as it likes.
 TEST(ModelFile, LocalNumbersOfAnotherWriterAreTranslated) {
     StoredObject tree = [] {
-        const sample::SampleModel sample = sample::wholeModel();
-        return treeOfModel(*sample.model, *sample.header);
+        const sample::SampleModel sample = sample::WholeModel();
+        return TreeOfModel(*sample.model, *sample.header);
     }();
     const StoredObject original = tree;
     const auto other = [](std::uint16_t pid) {
@@ -151,7 +151,7 @@ TEST(ModelFile, LocalNumbersOfAnotherWriterAreTranslated) {
     const std::function<void(StoredObject&)> renumber = [&](StoredObject& object) {
         for (StoredProperty& property : object.properties) {
             property.pid = other(property.pid);
-            if (property.pid == meta::localIdentification && property.bytes[1] >= 0x80) {
+            if (property.pid == meta::kLocalIdentification && property.bytes[1] >= 0x80) {
                 property.bytes[1] = static_cast<std::uint8_t>(property.bytes[1] - 0x10);
             }
             for (StoredObject& contained : property.objects) {
@@ -162,14 +162,14 @@ TEST(ModelFile, LocalNumbersOfAnotherWriterAreTranslated) {
     renumber(tree);
     ASSERT_NE(tree, original);
     sample::SampleModel read;
-    read.model = sample::newModel();
-    read.header = readModel(tree, *read.model);
-    EXPECT_EQ(treeOfModel(*read.model, *read.header), original);
+    read.model = sample::NewModel();
+    read.header = ReadModel(tree, *read.model);
+    EXPECT_EQ(TreeOfModel(*read.model, *read.header), original);
 }
 
 // Some built-in properties have local numbers too.
 TEST(ModelFile, BuiltInPropertiesWithLocalNumbersAreTranslated) {
-    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel sample = sample::WholeModel();
     Object* descriptor =
         sample::mob(*sample.header, 0).ObjectAt(prop::SourceMob_EssenceDescription);
     const RefPtr<Object> mpeg =
@@ -177,7 +177,7 @@ TEST(ModelFile, BuiltInPropertiesWithLocalNumbersAreTranslated) {
     ASSERT_GE(mpeg->PutInteger(prop::MPEGVideoDescriptor_BitRate, 50000000), 0);
     ASSERT_GE(descriptor->AppendObject(prop::MultipleDescriptor_FileDescriptors, mpeg->Identity()),
               0);
-    const Bytes file = bytesOf(sample);
+    const Bytes file = BytesOf(sample);
     const sample::SampleModel read = reread(file);
     descriptor = sample::mob(*read.header, 0).ObjectAt(prop::SourceMob_EssenceDescription);
     const Object* again = descriptor->ObjectAt(prop::MultipleDescriptor_FileDescriptors, 1);
@@ -186,19 +186,19 @@ TEST(ModelFile, BuiltInPropertiesWithLocalNumbersAreTranslated) {
     // The numbers did differ, or nothing was tried.
     EXPECT_NE(read.model->FindProperty(prop::MPEGVideoDescriptor_BitRate.id)->pid(),
               sample.model->FindProperty(prop::MPEGVideoDescriptor_BitRate.id)->pid());
-    EXPECT_NE(read.model->FindProperty(sample::quadPropertyId), nullptr);
+    EXPECT_NE(read.model->FindProperty(sample::kQuadPropertyId), nullptr);
 }
 
 TEST(ModelFile, EssenceIsKeptAsAStream) {
-    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel sample = sample::WholeModel();
     const RefPtr<Object> essence =
         sample.model->CreateObject(*sample.model->FindClass(AUID_AAFEssenceData));
-    ASSERT_GE(essence->PutStruct(prop::EssenceData_MobID, sample::mobId(5)), 0);
+    ASSERT_GE(essence->PutStruct(prop::EssenceData_MobID, sample::MobId(5)), 0);
     essence->RequireValue(prop::EssenceData_Data)->BytesToChange() = Bytes(700000, 0x2E);
     Object* content = sample.header->ObjectAt(prop::Header_Content);
     ASSERT_GE(content->AddToSet(prop::ContentStorage_EssenceData, essence->Identity()), 0);
     for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
-        const sample::SampleModel read = reread(bytesOf(sample, size));
+        const sample::SampleModel read = reread(BytesOf(sample, size));
         const Object* again = read.header->ObjectAt(prop::Header_Content)
                                   ->ObjectAt(prop::ContentStorage_EssenceData, 0);
         ASSERT_NE(again, nullptr);
@@ -207,23 +207,23 @@ TEST(ModelFile, EssenceIsKeptAsAStream) {
 }
 
 TEST(ModelFile, OnlyDefinitionsThatAreReferredToOrOwnAreStored) {
-    const sample::SampleModel sample = sample::wholeModel();
-    const StoredObject tree = treeOfModel(*sample.model, *sample.header);
+    const sample::SampleModel sample = sample::WholeModel();
+    const StoredObject tree = TreeOfModel(*sample.model, *sample.header);
     const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
-    EXPECT_EQ(dictionary.find(prop::Dictionary_DataDefinitions.pid)->objects.size(), 3u);
-    EXPECT_EQ(dictionary.find(prop::Dictionary_ContainerDefinitions.pid)->objects.size(), 2u);
-    EXPECT_EQ(dictionary.find(prop::Dictionary_OperationDefinitions.pid), nullptr);
+    EXPECT_EQ(dictionary.Find(prop::Dictionary_DataDefinitions.pid)->objects.size(), 3u);
+    EXPECT_EQ(dictionary.Find(prop::Dictionary_ContainerDefinitions.pid)->objects.size(), 2u);
+    EXPECT_EQ(dictionary.Find(prop::Dictionary_OperationDefinitions.pid), nullptr);
 }
 
 TEST(ModelFile, TheMetaDictionaryHoldsWhatIsUsedAndIsClosed) {
-    const sample::SampleModel sample = sample::wholeModel();
-    const StoredObject tree = treeOfModel(*sample.model, *sample.header);
-    const MetaRecords records = readMetaDictionary(child(tree, 1));
-    const std::set<std::wstring> names = storedClasses(tree);
+    const sample::SampleModel sample = sample::WholeModel();
+    const StoredObject tree = TreeOfModel(*sample.model, *sample.header);
+    const MetaRecords records = ReadMetaDictionary(child(tree, 1));
+    const std::set<std::wstring> names = StoredClasses(tree);
     for (const wchar_t* name : {L"SourceMob", L"CDCIDescriptor", L"ExampleLocator", L"Timecode",
-                                 L"ClassDefinition", L"TypeDefinitionRecord", L"MetaDictionary",
-                                 L"PropertyDefinition", L"Header", L"DataDefinition"}) {
-        EXPECT_EQ(names.count(name), 1u) << toUtf8(name);
+                                L"ClassDefinition", L"TypeDefinitionRecord", L"MetaDictionary",
+                                L"PropertyDefinition", L"Header", L"DataDefinition"}) {
+        EXPECT_EQ(names.count(name), 1u) << ToUtf8(name);
     }
     EXPECT_EQ(names.count(L"RGBADescriptor"), 0u);
     EXPECT_EQ(names.count(L"MPEGVideoDescriptor"), 0u);
@@ -231,62 +231,62 @@ TEST(ModelFile, TheMetaDictionaryHoldsWhatIsUsedAndIsClosed) {
     std::set<StoredAuid> classes;
     std::set<StoredAuid> types;
     for (const MetaClass& entry : records.classes) {
-        classes.insert(storedAuid(entry.id));
+        classes.insert(AuidOf(entry.id));
     }
     for (const TypeFacts& entry : records.types) {
-        types.insert(storedAuid(entry.id));
+        types.insert(AuidOf(entry.id));
     }
     for (const MetaClass& entry : records.classes) {
-        EXPECT_EQ(classes.count(storedAuid(entry.parent)), 1u) << toUtf8(entry.name);
+        EXPECT_EQ(classes.count(AuidOf(entry.parent)), 1u) << ToUtf8(entry.name);
         for (const MetaProperty& property : entry.properties) {
-            EXPECT_EQ(types.count(storedAuid(property.type)), 1u) << toUtf8(property.name);
+            EXPECT_EQ(types.count(AuidOf(property.type)), 1u) << ToUtf8(property.name);
         }
     }
     for (const TypeFacts& entry : records.types) {
         const bool isReference =
             entry.kind == TypeKind::StrongReference || entry.kind == TypeKind::WeakReference;
         if (entry.target != GUID{}) {
-            EXPECT_EQ((isReference ? classes : types).count(storedAuid(entry.target)), 1u)
-                << toUtf8(entry.name);
+            EXPECT_EQ((isReference ? classes : types).count(AuidOf(entry.target)), 1u)
+                << ToUtf8(entry.name);
         }
         for (const TypeMember& member : entry.members) {
             if (entry.kind == TypeKind::Record) {
-                EXPECT_EQ(types.count(storedAuid(member.id)), 1u) << toUtf8(entry.name);
+                EXPECT_EQ(types.count(AuidOf(member.id)), 1u) << ToUtf8(entry.name);
             }
         }
     }
 }
 
 TEST(ModelFile, RequiredCollectionsAreStoredEmpty) {
-    const sample::SampleModel sample = sample::emptyModel();
-    const StoredObject tree = treeOfModel(*sample.model, *sample.header);
+    const sample::SampleModel sample = sample::EmptyModel();
+    const StoredObject tree = TreeOfModel(*sample.model, *sample.header);
     const StoredObject& content = child(child(tree, 2), prop::Header_Content.pid);
     for (const PropertyKey& key : {prop::ContentStorage_Mobs, prop::ContentStorage_EssenceData}) {
-        const StoredProperty* set = content.find(key.pid);
+        const StoredProperty* set = content.Find(key.pid);
         ASSERT_NE(set, nullptr);
         EXPECT_TRUE(set->objects.empty());
         EXPECT_EQ(set->keySize, 32);
     }
-    EXPECT_EQ(content.find(prop::ContentStorage_Mobs.pid)->keyPid, prop::Mob_MobID.pid);
-    EXPECT_EQ(content.find(prop::ContentStorage_EssenceData.pid)->keyPid,
+    EXPECT_EQ(content.Find(prop::ContentStorage_Mobs.pid)->keyPid, prop::Mob_MobID.pid);
+    EXPECT_EQ(content.Find(prop::ContentStorage_EssenceData.pid)->keyPid,
               prop::EssenceData_MobID.pid);
 }
 
 TEST(ModelFile, ASlotWithoutSegmentIsRefused) {
-    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel sample = sample::WholeModel();
     Object& slot = sample::slot(sample::mob(*sample.header, 0), 0);
     ASSERT_GE(slot.RemoveValue(prop::MobSlot_Segment), 0);
     EXPECT_EQ(refusal(sample), "Content: Mobs: Slots: TimelineMobSlot has no Segment");
 }
 
 TEST(ModelFile, ASourceMobWithoutDescriptorIsRefused) {
-    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel sample = sample::WholeModel();
     ASSERT_GE(sample::mob(*sample.header, 0).RemoveValue(prop::SourceMob_EssenceDescription), 0);
     EXPECT_EQ(refusal(sample), "Content: Mobs: SourceMob has no EssenceDescription");
 }
 
 TEST(ModelFile, ADefinitionThatTheDictionaryLacksIsRefused) {
-    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel sample = sample::WholeModel();
     Object& import = sample::mob(*sample.header, 1);
     Object* timecode = sample::slot(import, 0).ObjectAt(prop::MobSlot_Segment);
     timecode->FindValue(prop::Component_DataDefinition)->BytesToChange()[0] ^= 0xFF;
@@ -295,11 +295,11 @@ TEST(ModelFile, ADefinitionThatTheDictionaryLacksIsRefused) {
 }
 
 TEST(ModelFile, AFileKeepsWhatItSaysOfABuiltInDefinition) {
-    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel sample = sample::WholeModel();
     auto* picture =
         dynamic_cast<Object*>(sample.model->FindTarget(AUID_AAFDataDef, kAAFDataDef_Picture));
     ASSERT_GE(picture->PutString(prop::DefinitionObject_Description, L"moving"), 0);
-    const sample::SampleModel read = reread(bytesOf(sample));
+    const sample::SampleModel read = reread(BytesOf(sample));
     auto* again =
         dynamic_cast<Object*>(read.model->FindTarget(AUID_AAFDataDef, kAAFDataDef_Picture));
     EXPECT_EQ(again->StringOr(prop::DefinitionObject_Description, L""), L"moving");
@@ -308,26 +308,26 @@ TEST(ModelFile, AFileKeepsWhatItSaysOfABuiltInDefinition) {
 
 TEST(ModelFile, SavesAndLoadsByPathAndNamesThePathInErrors) {
     const TestFolder folder;
-    const sample::SampleModel sample = sample::wholeModel();
+    const sample::SampleModel sample = sample::WholeModel();
     for (SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
-        const FileResult saved = saveModel(*sample.model, *sample.header, folder / "a.aaf", size);
+        const FileResult saved = SaveModel(*sample.model, *sample.header, folder / "a.aaf", size);
         ASSERT_TRUE(saved) << saved.message;
-        const RefPtr<Model> model = sample::newModel();
+        const RefPtr<Model> model = sample::NewModel();
         RefPtr<Object> header;
-        const FileResult loaded = loadModel(folder / "a.aaf", *model, header);
+        const FileResult loaded = LoadModel(folder / "a.aaf", *model, header);
         ASSERT_TRUE(loaded) << loaded.message;
         ASSERT_TRUE(header);
     }
     ASSERT_GE(sample::mob(*sample.header, 0).RemoveValue(prop::SourceMob_EssenceDescription), 0);
     const FileResult refused =
-        saveModel(*sample.model, *sample.header, folder / "b.aaf", SectorSize::Bytes512);
+        SaveModel(*sample.model, *sample.header, folder / "b.aaf", SectorSize::Bytes512);
     EXPECT_EQ(refused.failure, FileFailure::NotStorable);
     EXPECT_EQ(refused.message, (folder / "b.aaf").u8string() +
                                    ": Content: Mobs: SourceMob has no EssenceDescription");
     EXPECT_FALSE(fs::exists(folder / "b.aaf"));
 
-    const RefPtr<Model> model = sample::newModel();
+    const RefPtr<Model> model = sample::NewModel();
     RefPtr<Object> header;
-    EXPECT_EQ(loadModel(folder / "absent.aaf", *model, header).failure, FileFailure::NotThere);
+    EXPECT_EQ(LoadModel(folder / "absent.aaf", *model, header).failure, FileFailure::NotThere);
     EXPECT_FALSE(header);
 }

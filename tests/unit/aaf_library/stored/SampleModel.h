@@ -15,29 +15,29 @@
 
 namespace aaf::stored::sample {
 
-inline constexpr GUID quadTypeId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E01");
-inline constexpr GUID quadPropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E02");
-inline constexpr GUID notePropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E03");
-inline constexpr GUID ownClassId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E04");
-inline constexpr GUID ownPropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E05");
-inline constexpr GUID ownDefinitionId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E06");
+inline constexpr GUID kQuadTypeId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E01");
+inline constexpr GUID kQuadPropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E02");
+inline constexpr GUID kNotePropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E03");
+inline constexpr GUID kOwnClassId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E04");
+inline constexpr GUID kOwnPropertyId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E05");
+inline constexpr GUID kOwnDefinitionId = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E06");
 
-RefPtr<Model> newModel();
+RefPtr<Model> NewModel();
 
 struct SampleModel {
     RefPtr<Model> model;
     RefPtr<Object> header;
 };
 
-SampleModel wholeModel();
+SampleModel WholeModel();
 
 // The parts of a model that is known to look like the sample.
 Object& mob(Object& header, std::size_t index);
 Object& slot(Object& mob, std::size_t index);
 
 // A header with an empty content storage.
-SampleModel emptyModel();
+SampleModel EmptyModel();
 
-aafMobID_t mobId(std::uint8_t last);
+aafMobID_t MobId(std::uint8_t last);
 
 }  // namespace aaf::stored::sample

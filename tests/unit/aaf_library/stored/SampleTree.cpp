@@ -11,7 +11,7 @@ namespace aaf::stored::sample {
 
 namespace {
 
-constexpr std::uint16_t keyPid = 0x0005;
+constexpr std::uint16_t kEyPid = 0x0005;
 
 StoredProperty weak(std::uint16_t pid, StoredForm form, const std::u16string& name,
                     std::vector<Bytes> keys, std::vector<std::uint16_t> path) {
@@ -20,7 +20,7 @@ StoredProperty weak(std::uint16_t pid, StoredForm form, const std::u16string& na
     property.form = form;
     property.name = name;
     property.keys = std::move(keys);
-    property.keyPid = keyPid;
+    property.keyPid = kEyPid;
     property.targetPath = std::move(path);
     return property;
 }
@@ -85,7 +85,7 @@ StoredProperty stream(std::uint16_t pid, const std::u16string& name, Bytes conte
 StoredObject keyed(std::uint8_t id) {
     StoredObject object;
     object.classId = auid(0x70);
-    object.properties.push_back(data(keyPid, bytes(auid(id))));
+    object.properties.push_back(data(kEyPid, bytes(auid(id))));
     return object;
 }
 
@@ -95,15 +95,15 @@ StoredProperty set(std::uint16_t pid, const std::u16string& name,
     property.pid = pid;
     property.form = StoredForm::StrongSet;
     property.name = name;
-    property.keyPid = keyPid;
+    property.keyPid = kEyPid;
     for (const StoredObject& object : objects) {
-        property.keys.push_back(object.find(keyPid)->bytes);
+        property.keys.push_back(object.Find(kEyPid)->bytes);
     }
     property.objects = std::move(objects);
     return property;
 }
 
-StoredObject everyForm() {
+StoredObject EveryForm() {
     StoredObject leaf;
     leaf.classId = auid(9);
     leaf.properties = {text(0x5001, u""), text(0x5002, u"a \xD83C\xDFAC clip"),
@@ -130,15 +130,15 @@ StoredObject everyForm() {
     };
 
     StoredObject root;
-    root.classId = rootClassId;
+    root.classId = kRootClassId;
     root.properties = {set(0x0001, u"MetaDictionary", {keyed(0x11), keyed(0x12)}),
                        reference(0x0002, u"Header", holder)};
     return root;
 }
 
-StoredObject rootWith(StoredProperty property) {
+StoredObject RootWith(StoredProperty property) {
     StoredObject root;
-    root.classId = rootClassId;
+    root.classId = kRootClassId;
     root.properties.push_back(std::move(property));
     return root;
 }

@@ -29,9 +29,9 @@ StoredProperty set(std::uint16_t pid, const std::u16string& name,
 // streams below and above the limit for small ones, weak references of each
 // kind into two different sets, an empty vector and an empty set, an empty
 // text, a text with a surrogate pair, a squeezed name.
-StoredObject everyForm();
+StoredObject EveryForm();
 
 // A root whose property 0002 holds the object.
-StoredObject rootWith(StoredProperty property);
+StoredObject RootWith(StoredProperty property);
 
 }  // namespace aaf::stored::sample

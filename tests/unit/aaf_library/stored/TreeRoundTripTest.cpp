@@ -15,14 +15,14 @@ using namespace aaf::stored;
 namespace {
 
 // What a tree looks like after a round trip: squeezed names stay squeezed.
-StoredObject asRead(StoredObject object) {
+StoredObject AsRead(StoredObject object) {
     for (StoredProperty& property : object.properties) {
         if (property.form == StoredForm::StrongVector || property.form == StoredForm::StrongSet ||
             property.form == StoredForm::WeakVector || property.form == StoredForm::WeakSet) {
-            property.name = propertyPart(collectionName(property.name, property.pid), property.pid);
+            property.name = PropertyPart(CollectionName(property.name, property.pid), property.pid);
         }
         for (StoredObject& contained : property.objects) {
-            contained = asRead(contained);
+            contained = AsRead(contained);
         }
     }
     return object;
@@ -33,26 +33,26 @@ class TreeRoundTrip : public testing::TestWithParam<SectorSize> {};
 }  // namespace
 
 TEST_P(TreeRoundTrip, EveryStoredFormComesBackAsItWas) {
-    const StoredObject tree = sample::everyForm();
-    EXPECT_EQ(readTree(writeTree(tree, GetParam())), asRead(tree));
+    const StoredObject tree = sample::EveryForm();
+    EXPECT_EQ(ReadTree(WriteTree(tree, GetParam())), AsRead(tree));
 }
 
 TEST_P(TreeRoundTrip, TheSameTreeGivesTheSameBytes) {
-    const StoredObject tree = sample::everyForm();
-    EXPECT_EQ(writeTree(tree, GetParam()), writeTree(tree, GetParam()));
+    const StoredObject tree = sample::EveryForm();
+    EXPECT_EQ(WriteTree(tree, GetParam()), WriteTree(tree, GetParam()));
 }
 
 TEST_P(TreeRoundTrip, ATreeThatWasReadIsWrittenAsTheSameBytes) {
-    const Bytes first = writeTree(sample::everyForm(), GetParam());
-    EXPECT_EQ(writeTree(readTree(first), GetParam()), first);
+    const Bytes first = WriteTree(sample::EveryForm(), GetParam());
+    EXPECT_EQ(WriteTree(ReadTree(first), GetParam()), first);
 }
 
 TEST_P(TreeRoundTrip, TheFileIsAWholeNumberOfSectorsWithRootClassAndSignature) {
-    const Bytes file = writeTree(sample::everyForm(), GetParam());
+    const Bytes file = WriteTree(sample::EveryForm(), GetParam());
     EXPECT_EQ(file.size() % static_cast<std::size_t>(GetParam()), 0u);
     const CompoundFileReader reader(file);
     EXPECT_EQ(reader.sectorSize(), GetParam());
-    EXPECT_EQ(reader.entry(CompoundFileReader::rootIndex).classId, rootClassId);
+    EXPECT_EQ(reader.entry(CompoundFileReader::kRootIndex).classId, kRootClassId);
     const StoredAuid wanted =
         GetParam() == SectorSize::Bytes512
             ? StoredAuid{0x41, 0x41, 0x46, 0x42, 0x0D, 0, 0x4F, 0x4D,
@@ -66,18 +66,18 @@ TEST_P(TreeRoundTrip, TheFileIsAWholeNumberOfSectorsWithRootClassAndSignature) {
 TEST_P(TreeRoundTrip, StreamsOfManySizesKeepTheFileConsistent) {
     for (std::size_t sectors = 118; sectors <= 134; ++sectors) {
         const Bytes content(sectors * 4096 - 1, 0xAB);
-        const StoredObject tree = sample::rootWith(sample::stream(0x2702, u"Data", content));
-        const Bytes file = writeTree(tree, GetParam());
+        const StoredObject tree = sample::RootWith(sample::stream(0x2702, u"Data", content));
+        const Bytes file = WriteTree(tree, GetParam());
         ASSERT_EQ(file.size() % static_cast<std::size_t>(GetParam()), 0u) << sectors;
-        ASSERT_EQ(readTree(file), tree) << sectors;
+        ASSERT_EQ(ReadTree(file), tree) << sectors;
     }
 }
 
 // More table sectors than the header can list.
 TEST(TreeRoundTripLarge, ATableListBeyondTheHeaderIsFollowed) {
     const Bytes content(8u << 20, 0x5C);
-    const StoredObject tree = sample::rootWith(sample::stream(0x2702, u"Data", content));
-    EXPECT_EQ(readTree(writeTree(tree, SectorSize::Bytes512)), tree);
+    const StoredObject tree = sample::RootWith(sample::stream(0x2702, u"Data", content));
+    EXPECT_EQ(ReadTree(WriteTree(tree, SectorSize::Bytes512)), tree);
 }
 
 TEST_P(TreeRoundTrip, ManyObjectsInOneSetAreKept) {
@@ -88,17 +88,17 @@ TEST_P(TreeRoundTrip, ManyObjectsInOneSetAreKept) {
         set.keys.push_back(object.properties.front().bytes);
         set.objects.push_back(object);
     }
-    const StoredObject tree = sample::rootWith(set);
-    EXPECT_EQ(readTree(writeTree(tree, GetParam())), tree);
+    const StoredObject tree = sample::RootWith(set);
+    EXPECT_EQ(ReadTree(WriteTree(tree, GetParam())), tree);
 }
 
 TEST_P(TreeRoundTrip, SetsAreStoredInTheOrderOfTheirKeys) {
-    const StoredObject mixed = sample::rootWith(
+    const StoredObject mixed = sample::RootWith(
         sample::set(0x1901, u"Mobs", {sample::keyed(0xF0), sample::keyed(1), sample::keyed(0x70)}));
-    const StoredObject sorted = sample::rootWith(
+    const StoredObject sorted = sample::RootWith(
         sample::set(0x1901, u"Mobs", {sample::keyed(1), sample::keyed(0x70), sample::keyed(0xF0)}));
-    EXPECT_EQ(readTree(writeTree(mixed, GetParam())), sorted);
-    EXPECT_EQ(writeTree(mixed, GetParam()), writeTree(sorted, GetParam()));
+    EXPECT_EQ(ReadTree(WriteTree(mixed, GetParam())), sorted);
+    EXPECT_EQ(WriteTree(mixed, GetParam()), WriteTree(sorted, GetParam()));
 }
 
 TEST_P(TreeRoundTrip, WeakSetsAreStoredInTheOrderOfTheirKeysAndVectorsAsTheyAre) {
@@ -111,31 +111,31 @@ TEST_P(TreeRoundTrip, WeakSetsAreStoredInTheOrderOfTheirKeysAndVectorsAsTheyAre)
     weak.keys = {sample::bytes(sample::auid(9)), sample::bytes(sample::auid(3))};
     StoredProperty sorted = weak;
     std::reverse(sorted.keys.begin(), sorted.keys.end());
-    EXPECT_EQ(readTree(writeTree(sample::rootWith(weak), GetParam())), sample::rootWith(sorted));
+    EXPECT_EQ(ReadTree(WriteTree(sample::RootWith(weak), GetParam())), sample::RootWith(sorted));
     weak.form = StoredForm::WeakVector;
-    EXPECT_EQ(readTree(writeTree(sample::rootWith(weak), GetParam())), sample::rootWith(weak));
+    EXPECT_EQ(ReadTree(WriteTree(sample::RootWith(weak), GetParam())), sample::RootWith(weak));
 }
 
 TEST_P(TreeRoundTrip, PropertiesWithoutContentAreLeftOut) {
     StoredObject tree;
-    tree.classId = rootClassId;
+    tree.classId = kRootClassId;
     tree.properties = {sample::data(0x0201, {}), sample::stream(0x2702, u"Data", {}),
                        sample::text(0x4402, u"")};
     StoredObject expected = tree;
     expected.properties.erase(expected.properties.begin(), expected.properties.begin() + 2);
-    EXPECT_EQ(readTree(writeTree(tree, GetParam())), expected);
+    EXPECT_EQ(ReadTree(WriteTree(tree, GetParam())), expected);
 }
 
 TEST_P(TreeRoundTrip, AFormThatNobodyKnowsSurvivesAsBytes) {
     StoredProperty odd = sample::data(0x4402, {9, 8, 7});
     odd.form = StoredForm(0x86);
-    const StoredObject tree = sample::rootWith(odd);
-    EXPECT_EQ(readTree(writeTree(tree, GetParam())), tree);
+    const StoredObject tree = sample::RootWith(odd);
+    EXPECT_EQ(ReadTree(WriteTree(tree, GetParam())), tree);
 }
 
 TEST_P(TreeRoundTrip, TheLargestValueIsKept) {
-    const StoredObject tree = sample::rootWith(sample::data(0x4402, Bytes(65535, 0x31)));
-    EXPECT_EQ(readTree(writeTree(tree, GetParam())), tree);
+    const StoredObject tree = sample::RootWith(sample::data(0x4402, Bytes(65535, 0x31)));
+    EXPECT_EQ(ReadTree(WriteTree(tree, GetParam())), tree);
 }
 
 INSTANTIATE_TEST_SUITE_P(SectorSizes, TreeRoundTrip,

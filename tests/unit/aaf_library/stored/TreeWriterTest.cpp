@@ -13,9 +13,9 @@ using namespace aaf::stored;
 
 namespace {
 
-Bytes streamOf(const Bytes& file, const std::vector<std::u16string>& path) {
+Bytes StreamOf(const Bytes& file, const std::vector<std::u16string>& path) {
     CompoundFileReader reader(file);
-    std::uint32_t at = CompoundFileReader::rootIndex;
+    std::uint32_t at = CompoundFileReader::kRootIndex;
     for (const std::u16string& name : path) {
         const auto& contained = reader.entry(at).contained;
         const auto found = contained.find(name);
@@ -24,12 +24,12 @@ Bytes streamOf(const Bytes& file, const std::vector<std::u16string>& path) {
         }
         at = found->second;
     }
-    return reader.read(at);
+    return reader.Read(at);
 }
 
 std::string refusal(const StoredObject& tree) {
     try {
-        writeTree(tree, SectorSize::Bytes512);
+        WriteTree(tree, SectorSize::Bytes512);
         return "";
     } catch (const StoredError& problem) {
         return problem.what();
@@ -51,7 +51,7 @@ TEST(TreeWriter, LaysOutATimecodeByteForByte) {
     segment.properties = {definition, sample::data(0x0202, {0x64, 0, 0, 0, 0, 0, 0, 0}),
                           sample::data(0x1501, {0x80, 0x51, 1, 0, 0, 0, 0, 0}),
                           sample::data(0x1502, {0x18, 0}), sample::data(0x1503, {0})};
-    const Bytes file = writeTree(sample::rootWith(sample::reference(0x4803, u"Segment", segment)),
+    const Bytes file = WriteTree(sample::RootWith(sample::reference(0x4803, u"Segment", segment)),
                                  SectorSize::Bytes512);
     const Bytes expected = {
         0x4C, 0x20, 0x05, 0x00, 0x01, 0x02, 0x02, 0x00, 0x15, 0x00, 0x02, 0x02, 0x82, 0x00, 0x08,
@@ -59,46 +59,46 @@ TEST(TreeWriter, LaysOutATimecodeByteForByte) {
         0x82, 0x00, 0x01, 0x00, 0x00, 0x00, 0x01, 0x1B, 0x10, 0x01, 0x02, 0x03, 0x01, 0x00, 0x01,
         0x00, 0x00, 0x06, 0x0E, 0x2B, 0x34, 0x04, 0x01, 0x01, 0x01, 0x64, 0x00, 0x00, 0x00, 0x00,
         0x00, 0x00, 0x00, 0x80, 0x51, 0x01, 0x00, 0x00, 0x00, 0x00, 0x00, 0x18, 0x00, 0x00};
-    EXPECT_EQ(streamOf(file, {u"Segment-4803", u"properties"}), expected);
+    EXPECT_EQ(StreamOf(file, {u"Segment-4803", u"properties"}), expected);
     const Bytes paths = {0x4C, 1, 0, 4, 0, 0, 0, 0x02, 0, 0x04, 0x3B, 0x05, 0x26, 0, 0};
-    EXPECT_EQ(streamOf(file, {u"referenced properties"}), paths);
+    EXPECT_EQ(StreamOf(file, {u"referenced properties"}), paths);
 }
 
 TEST(TreeWriter, LaysOutTheIndexOfAVector) {
     const StoredObject bare;
     const Bytes file =
-        writeTree(sample::rootWith(sample::vector(0x4403, u"Slots", {bare, bare, bare})),
+        WriteTree(sample::RootWith(sample::vector(0x4403, u"Slots", {bare, bare, bare})),
                   SectorSize::Bytes512);
     const Bytes expected = {3, 0, 0, 0, 3, 0, 0, 0, 0xFF, 0xFF, 0xFF, 0xFF,
                             0, 0, 0, 0, 1, 0, 0, 0, 2,    0,    0,    0};
-    EXPECT_EQ(streamOf(file, {u"Slots-4403 index"}), expected);
-    EXPECT_EQ(streamOf(file, {u"Slots-4403{2}", u"properties"}), (Bytes{0x4C, 0x20, 0, 0}));
+    EXPECT_EQ(StreamOf(file, {u"Slots-4403 index"}), expected);
+    EXPECT_EQ(StreamOf(file, {u"Slots-4403{2}", u"properties"}), (Bytes{0x4C, 0x20, 0, 0}));
 }
 
 TEST(TreeWriter, LaysOutTheIndexOfASet) {
     const Bytes file =
-        writeTree(sample::rootWith(sample::set(0x1901, u"Mobs", {sample::keyed(0x42)})),
+        WriteTree(sample::RootWith(sample::set(0x1901, u"Mobs", {sample::keyed(0x42)})),
                   SectorSize::Bytes4096);
     Bytes expected = {1, 0, 0,  0, 1, 0, 0, 0, 0xFF, 0xFF, 0xFF, 0xFF,
                       5, 0, 16, 0, 0, 0, 0, 1, 0,    0,    0};
     const Bytes key = sample::bytes(sample::auid(0x42));
     expected.insert(expected.end(), key.begin(), key.end());
-    EXPECT_EQ(streamOf(file, {u"Mobs-1901 index"}), expected);
+    EXPECT_EQ(StreamOf(file, {u"Mobs-1901 index"}), expected);
 }
 
 TEST(TreeWriter, RefusesAPropertyThatOccursTwice) {
-    StoredObject tree = sample::rootWith(sample::data(0x4402, {1}));
+    StoredObject tree = sample::RootWith(sample::data(0x4402, {1}));
     tree.properties.push_back(sample::data(0x4402, {2}));
     EXPECT_EQ(refusal(tree), "property 4402: occurs twice in one object");
 }
 
 TEST(TreeWriter, RefusesAValueThatDoesNotFitItsSizeField) {
-    EXPECT_EQ(refusal(sample::rootWith(sample::data(0x4402, Bytes(65536)))),
+    EXPECT_EQ(refusal(sample::RootWith(sample::data(0x4402, Bytes(65536)))),
               "property 4402: 65536 bytes, a value may take 65535");
 }
 
 TEST(TreeWriter, RefusesEqualKeysInASet) {
-    EXPECT_EQ(refusal(sample::rootWith(
+    EXPECT_EQ(refusal(sample::RootWith(
                   sample::set(0x1901, u"Mobs", {sample::keyed(1), sample::keyed(1)}))),
               "property 1901: two elements of a set have the same key");
 }
@@ -106,19 +106,19 @@ TEST(TreeWriter, RefusesEqualKeysInASet) {
 TEST(TreeWriter, RefusesAnElementThatDoesNotStoreItsKey) {
     StoredProperty set = sample::set(0x1901, u"Mobs", {sample::keyed(1)});
     set.objects[0].properties.clear();
-    EXPECT_EQ(refusal(sample::rootWith(set)), "property 1901: an element does not store its key");
+    EXPECT_EQ(refusal(sample::RootWith(set)), "property 1901: an element does not store its key");
 }
 
 TEST(TreeWriter, RefusesKeysAndObjectsThatDoNotPair) {
     StoredProperty set = sample::set(0x1901, u"Mobs", {sample::keyed(1)});
     set.keys.clear();
-    EXPECT_EQ(refusal(sample::rootWith(set)), "property 1901: a set has 1 elements and 0 keys");
+    EXPECT_EQ(refusal(sample::RootWith(set)), "property 1901: a set has 1 elements and 0 keys");
 }
 
 TEST(TreeWriter, RefusesAReferenceWithoutObject) {
     StoredProperty property = sample::reference(0x4803, u"Segment", {});
     property.objects.clear();
-    EXPECT_EQ(refusal(sample::rootWith(property)),
+    EXPECT_EQ(refusal(sample::RootWith(property)),
               "property 4803: a strong reference holds one object, not 0");
 }
 
@@ -126,36 +126,36 @@ TEST(TreeWriter, RefusesAWeakReferenceThatLeadsNowhere) {
     StoredProperty property;
     property.pid = 0x0201;
     property.form = StoredForm::WeakReference;
-    EXPECT_EQ(refusal(sample::rootWith(property)),
+    EXPECT_EQ(refusal(sample::RootWith(property)),
               "property 0201: a weak reference has one key, not 0");
     property.keys = {sample::bytes(sample::auid(1))};
-    EXPECT_EQ(refusal(sample::rootWith(property)),
+    EXPECT_EQ(refusal(sample::RootWith(property)),
               "property 0201: a weak reference without a path to its targets");
     property.targetPath = {2, 0, 3};
-    EXPECT_EQ(refusal(sample::rootWith(property)),
+    EXPECT_EQ(refusal(sample::RootWith(property)),
               "property 0201: a weak reference without a path to its targets");
     property.targetPath = {2, 3};
     property.keys = {Bytes(15)};
-    EXPECT_EQ(refusal(sample::rootWith(property)), "property 0201: a key of 15 bytes");
+    EXPECT_EQ(refusal(sample::RootWith(property)), "property 0201: a key of 15 bytes");
 }
 
 TEST(TreeWriter, RefusesNamesThatACompoundFileCannotHold) {
-    EXPECT_EQ(refusal(sample::rootWith(sample::reference(0x4803, u"a/b", {}))),
+    EXPECT_EQ(refusal(sample::RootWith(sample::reference(0x4803, u"a/b", {}))),
               "\"a/b-4803\" cannot be the name of a storage or stream");
 }
 
 TEST(TreeWriter, RefusesNestingWithoutEnd) {
     StoredObject tree;
-    for (int i = 0; i < maximumDepth; ++i) {
-        tree = sample::rootWith(sample::reference(0x4803, u"Segment", tree));
+    for (int i = 0; i < kMaximumDepth; ++i) {
+        tree = sample::RootWith(sample::reference(0x4803, u"Segment", tree));
     }
     EXPECT_EQ(refusal(tree), "");
-    tree = sample::rootWith(sample::reference(0x4803, u"Segment", tree));
+    tree = sample::RootWith(sample::reference(0x4803, u"Segment", tree));
     EXPECT_NE(refusal(tree).find("objects are nested too deep"), std::string::npos);
 }
 
 TEST(TreeWriter, NamesThePlaceOfADeepDefect) {
-    StoredObject inner = sample::rootWith(sample::data(0x5001, Bytes(70000)));
-    const StoredObject tree = sample::rootWith(sample::vector(0x4403, u"Slots", {{}, inner}));
+    StoredObject inner = sample::RootWith(sample::data(0x5001, Bytes(70000)));
+    const StoredObject tree = sample::RootWith(sample::vector(0x4403, u"Slots", {{}, inner}));
     EXPECT_EQ(refusal(tree), "Slots-4403{1}: property 5001: 70000 bytes, a value may take 65535");
 }
