@@ -4,10 +4,6 @@
 
 #include <algorithm>
 
-#include "aaf_library/model/Enumerator.h"
-#include "host_interfaces/aaf/AAFMetaDefinitions.h"
-#include "host_interfaces/aaf/AAFTypeDefinitions.h"
-
 namespace aaf {
 
 GUID DefinitionObject::Identification() const {
@@ -37,43 +33,6 @@ HRESULT DefinitionObject::Initialize(aafUID_constref id, aafCharacter_constptr n
     return PutString(prop::DefinitionObject_Name, name);
 }
 
-HRESULT DefinitionObject::SetName(aafCharacter_constptr name) {
-    return PutString(prop::DefinitionObject_Name, name);
-}
-
-HRESULT DefinitionObject::GetName(aafCharacter* name, aafUInt32 bufSize) {
-    return ReadString(prop::DefinitionObject_Name, name, bufSize);
-}
-
-HRESULT DefinitionObject::GetNameBufLen(aafUInt32* bufSize) {
-    return ReadStringLength(prop::DefinitionObject_Name, bufSize);
-}
-
-HRESULT DefinitionObject::SetDescription(aafCharacter_constptr description) {
-    return PutString(prop::DefinitionObject_Description, description);
-}
-
-HRESULT DefinitionObject::GetDescription(aafCharacter* description, aafUInt32 bufSize) {
-    return ReadString(prop::DefinitionObject_Description, description, bufSize);
-}
-
-HRESULT DefinitionObject::GetDescriptionBufLen(aafUInt32* bufSize) {
-    return ReadStringLength(prop::DefinitionObject_Description, bufSize);
-}
-
-HRESULT DefinitionObject::GetAUID(aafUID_t* auid) {
-    return ReadStruct(prop::DefinitionObject_Identification, auid);
-}
-
-HRESULT ContainerDefinition::Initialize(aafUID_constref id, aafCharacter_constptr name,
-                                        aafCharacter_constptr description) {
-    return InitializeDefinition(id, name, description);
-}
-
-HRESULT ContainerDefinition::EssenceIsIdentified(aafBoolean_t* essenceIsIdentified) {
-    return ReadInteger(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified);
-}
-
 HRESULT ContainerDefinition::SetEssenceIsIdentified(aafBoolean_t essenceIsIdentified) {
     return IsBoolean(essenceIsIdentified)
                ? PutInteger(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified)
@@ -90,10 +49,6 @@ HRESULT CodecDefinition::IsEssenceKindSupported(IAAFDataDef* essenceKind,
         std::find(kinds.begin(), kinds.end(), ImplementationOf(essenceKind)) != kinds.end();
     *isSupported = found ? kAAFTrue : kAAFFalse;
     return AAFRESULT_SUCCESS;
-}
-
-HRESULT CodecDefinition::AddEssenceKind(IAAFDataDef* essenceKind) {
-    return AppendWeak(prop::CodecDefinition_DataDefinitions, essenceKind);
 }
 
 HRESULT CodecDefinition::CountEssenceKinds(aafUInt32* result) {
@@ -114,10 +69,6 @@ HRESULT CodecDefinition::GetEssenceKinds(IEnumAAFDataDefs** enumerator) {
         enumerator);
 }
 
-HRESULT CodecDefinition::GetFileDescriptorClass(IAAFClassDef** cls) {
-    return ReadWeak(prop::CodecDefinition_FileDescriptorClass, cls);
-}
-
 HRESULT CodecDefinition::SetFileDescriptorClass(IAAFClassDef* cls) {
     return PutWeak(prop::CodecDefinition_FileDescriptorClass, cls);
 }
@@ -129,18 +80,6 @@ HRESULT ParameterDefinition::Initialize(aafUID_constref id, aafCharacter_constpt
     }
     const HRESULT result = InitializeDefinition(id, name, description);
     return result < 0 ? result : PutWeak(prop::ParameterDefinition_Type, type);
-}
-
-HRESULT ParameterDefinition::GetTypeDefinition(IAAFTypeDef** typeDef) {
-    return ReadWeak(prop::ParameterDefinition_Type, typeDef);
-}
-
-HRESULT ParameterDefinition::SetDisplayUnits(aafCharacter_constptr displayUnits) {
-    return PutString(prop::ParameterDefinition_DisplayUnits, displayUnits);
-}
-
-HRESULT ParameterDefinition::GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) {
-    return ReadString(prop::ParameterDefinition_DisplayUnits, displayUnits, bufSize);
 }
 
 HRESULT ParameterDefinition::GetDisplayUnitsBufLen(aafUInt32* bufSize) {

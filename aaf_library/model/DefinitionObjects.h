@@ -2,7 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/model/Enumerator.h"
 #include "aaf_library/model/Object.h"
+#include "host_interfaces/aaf/AAFMetaDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "not_implemented/AAFDefinitions.h"
 #include "not_implemented/AAFEffectDefinitions.h"
 #include "not_implemented/AAFPluginDefinitions.h"
@@ -16,14 +19,28 @@ public:
     GUID Identification() const;
 
     // -- IAAFDefObject
-    HRESULT SetName(aafCharacter_constptr name) override;
-    HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) override;
-    HRESULT GetNameBufLen(aafUInt32* bufSize) override;
-    HRESULT SetDescription(aafCharacter_constptr description) override;
-    HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) override;
-    HRESULT GetDescriptionBufLen(aafUInt32* bufSize) override;
+    HRESULT SetName(aafCharacter_constptr name) override {
+        return PutString(prop::DefinitionObject_Name, name);
+    }
+    HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) override {
+        return ReadString(prop::DefinitionObject_Name, name, bufSize);
+    }
+    HRESULT GetNameBufLen(aafUInt32* bufSize) override {
+        return ReadStringLength(prop::DefinitionObject_Name, bufSize);
+    }
+    HRESULT SetDescription(aafCharacter_constptr description) override {
+        return PutString(prop::DefinitionObject_Description, description);
+    }
+    HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) override {
+        return ReadString(prop::DefinitionObject_Description, description, bufSize);
+    }
+    HRESULT GetDescriptionBufLen(aafUInt32* bufSize) override {
+        return ReadStringLength(prop::DefinitionObject_Description, bufSize);
+    }
     HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name) override;
-    HRESULT GetAUID(aafUID_t* auid) override;
+    HRESULT GetAUID(aafUID_t* auid) override {
+        return ReadStruct(prop::DefinitionObject_Identification, auid);
+    }
 
 protected:
     HRESULT InitializeDefinition(const GUID& id, aafCharacter_constptr name,
@@ -62,8 +79,12 @@ class ContainerDefinition : public Implements<DefinitionObject, IAAFContainerDef
 public:
     // -- IAAFContainerDef
     HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
-                       aafCharacter_constptr description) override;
-    HRESULT EssenceIsIdentified(aafBoolean_t* essenceIsIdentified) override;
+                       aafCharacter_constptr description) override {
+        return InitializeDefinition(id, name, description);
+    }
+    HRESULT EssenceIsIdentified(aafBoolean_t* essenceIsIdentified) override {
+        return ReadInteger(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified);
+    }
     HRESULT SetEssenceIsIdentified(aafBoolean_t essenceIsIdentified) override;
 };
 
@@ -88,10 +109,14 @@ class CodecDefinition : public PlainDefinition<IAAFCodecDef> {
 public:
     // -- IAAFCodecDef
     HRESULT IsEssenceKindSupported(IAAFDataDef* essenceKind, aafBoolean_t* isSupported) override;
-    HRESULT AddEssenceKind(IAAFDataDef* essenceKind) override;
+    HRESULT AddEssenceKind(IAAFDataDef* essenceKind) override {
+        return AppendWeak(prop::CodecDefinition_DataDefinitions, essenceKind);
+    }
     HRESULT CountEssenceKinds(aafUInt32* result) override;
     HRESULT GetEssenceKinds(IEnumAAFDataDefs** enumerator) override;
-    HRESULT GetFileDescriptorClass(IAAFClassDef** cls) override;
+    HRESULT GetFileDescriptorClass(IAAFClassDef** cls) override {
+        return ReadWeak(prop::CodecDefinition_FileDescriptorClass, cls);
+    }
     HRESULT SetFileDescriptorClass(IAAFClassDef* cls) override;
 };
 
@@ -101,9 +126,15 @@ public:
     // -- IAAFParameterDef
     HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name,
                        aafCharacter_constptr description, IAAFTypeDef* type) override;
-    HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) override;
-    HRESULT SetDisplayUnits(aafCharacter_constptr displayUnits) override;
-    HRESULT GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) override;
+    HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) override {
+        return ReadWeak(prop::ParameterDefinition_Type, typeDef);
+    }
+    HRESULT SetDisplayUnits(aafCharacter_constptr displayUnits) override {
+        return PutString(prop::ParameterDefinition_DisplayUnits, displayUnits);
+    }
+    HRESULT GetDisplayUnits(aafCharacter* displayUnits, aafUInt32 bufSize) override {
+        return ReadString(prop::ParameterDefinition_DisplayUnits, displayUnits, bufSize);
+    }
     HRESULT GetDisplayUnitsBufLen(aafUInt32* bufSize) override;
 };
 

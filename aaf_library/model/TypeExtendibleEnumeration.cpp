@@ -2,9 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/TypeExtendibleEnumeration.h"
 
-#include "aaf_library/model/StoredNumbers.h"
-#include "aaf_library/model/Text.h"
-
 namespace aaf {
 
 HRESULT TypeExtendibleEnumeration::Setup(const GUID& id, const std::wstring& name,
@@ -25,10 +22,6 @@ void TypeExtendibleEnumeration::AppendStored(const std::uint8_t* native, Bytes& 
 void TypeExtendibleEnumeration::CopyNative(const std::uint8_t* stored, std::uint8_t* native) const {
     const GUID value = GuidAt(stored);
     std::memcpy(native, &value, sizeof value);
-}
-
-HRESULT TypeExtendibleEnumeration::Initialize(aafUID_constref id, aafCharacter_constptr typeName) {
-    return typeName == nullptr ? AAFRESULT_NULL_PARAM : Setup(id, typeName, {});
 }
 
 const TypeExtendibleEnumeration::Member* TypeExtendibleEnumeration::FindMember(

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/model/StoredNumbers.h"
+#include "aaf_library/model/Text.h"
 #include "aaf_library/model/TypeDefinition.h"
 #include "not_implemented/AAFTypeDefinitions.h"
 
@@ -23,7 +25,9 @@ public:
     void CopyNative(const std::uint8_t* stored, std::uint8_t* native) const override;
 
     // -- IAAFTypeDefExtEnum
-    HRESULT Initialize(aafUID_constref id, aafCharacter_constptr typeName) override;
+    HRESULT Initialize(aafUID_constref id, aafCharacter_constptr typeName) override {
+        return typeName == nullptr ? AAFRESULT_NULL_PARAM : Setup(id, typeName, {});
+    }
     HRESULT CreateValueFromName(aafCharacter_constptr name, IAAFPropertyValue** propVal) override;
     HRESULT CountElements(aafUInt32* count) override;
     HRESULT GetElementValue(aafUInt32 index, aafUID_t* outValue) override;

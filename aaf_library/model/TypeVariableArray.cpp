@@ -45,11 +45,6 @@ HRESULT TypeVariableArray::CreateEmptyValue(IAAFPropertyValue** propVal) {
     return IsInitialized() ? GiveValue(*this, {}, propVal) : AAFRESULT_NOT_INITIALIZED;
 }
 
-HRESULT TypeVariableArray::PrependElement(IAAFPropertyValue* inPropVal,
-                                          IAAFPropertyValue* memberPropVal) {
-    return InsertElement(inPropVal, 0, memberPropVal);
-}
-
 HRESULT TypeVariableArray::RemoveElement(IAAFPropertyValue* inPropVal, aafUInt32 index) {
     PropertyValue* value = nullptr;
     const HRESULT result = Take(inPropVal, &value);

@@ -24,7 +24,10 @@ public:
     HRESULT CreateEmptyValue(IAAFPropertyValue** propVal) override;
 
     // -- IAAFTypeDefVariableArrayEx
-    HRESULT PrependElement(IAAFPropertyValue* inPropVal, IAAFPropertyValue* memberPropVal) override;
+    HRESULT PrependElement(IAAFPropertyValue* inPropVal,
+                           IAAFPropertyValue* memberPropVal) override {
+        return InsertElement(inPropVal, 0, memberPropVal);
+    }
     HRESULT RemoveElement(IAAFPropertyValue* inPropVal, aafUInt32 index) override;
     HRESULT InsertElement(IAAFPropertyValue* inPropVal, aafUInt32 index,
                           IAAFPropertyValue* memberPropVal) override;

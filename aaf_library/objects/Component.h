@@ -3,7 +3,9 @@
 #pragma once
 
 #include "aaf_library/model/Object.h"
+#include "aaf_library/objects/Annotations.h"
 #include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
 #include "not_implemented/AAFComponents.h"
 
 namespace aaf {
@@ -13,21 +15,47 @@ namespace aaf {
 class Component : public Implements<Object, IAAFComponent, IAAFComponent2> {
 public:
     HRESULT SetLength(aafLength_constref length) override;
-    HRESULT GetLength(aafLength_t* length) override;
-    HRESULT SetDataDef(IAAFDataDef* dataDef) override;
+    HRESULT GetLength(aafLength_t* length) override {
+        return ReadInteger(prop::Component_Length, length);
+    }
+    HRESULT SetDataDef(IAAFDataDef* dataDef) override {
+        return PutWeak(prop::Component_DataDefinition, dataDef);
+    }
     HRESULT GetDataDef(IAAFDataDef** dataDef) override;
 
-    HRESULT AppendKLVData(IAAFKLVData* data) override;
-    HRESULT CountKLVData(aafUInt32* numData) override;
-    HRESULT GetKLVData(IEnumAAFKLVData** enumerator) override;
-    HRESULT RemoveKLVData(IAAFKLVData* data) override;
-    HRESULT AppendComment(aafCharacter_constptr name, aafCharacter_constptr value) override;
-    HRESULT CountComments(aafUInt32* numComments) override;
-    HRESULT GetComments(IEnumAAFTaggedValues** enumerator) override;
-    HRESULT RemoveComment(IAAFTaggedValue* comment) override;
-    HRESULT AppendAttribute(aafCharacter_constptr name, aafCharacter_constptr value) override;
-    HRESULT CountAttributes(aafUInt32* numAttributes) override;
-    HRESULT GetAttributes(IEnumAAFTaggedValues** enumerator) override;
+    HRESULT AppendKLVData(IAAFKLVData* data) override {
+        return AppendObject(prop::Component_KLVData, data);
+    }
+    HRESULT CountKLVData(aafUInt32* numData) override {
+        return ReadCount(prop::Component_KLVData, numData);
+    }
+    HRESULT GetKLVData(IEnumAAFKLVData** enumerator) override {
+        return EnumerateList<IAAFKLVData>(this, prop::Component_KLVData, enumerator);
+    }
+    HRESULT RemoveKLVData(IAAFKLVData* data) override {
+        return RemoveFromList(*this, prop::Component_KLVData, data);
+    }
+    HRESULT AppendComment(aafCharacter_constptr name, aafCharacter_constptr value) override {
+        return AppendTaggedText(*this, prop::Component_UserComments, name, value);
+    }
+    HRESULT CountComments(aafUInt32* numComments) override {
+        return ReadCount(prop::Component_UserComments, numComments);
+    }
+    HRESULT GetComments(IEnumAAFTaggedValues** enumerator) override {
+        return EnumerateList<IAAFTaggedValue>(this, prop::Component_UserComments, enumerator);
+    }
+    HRESULT RemoveComment(IAAFTaggedValue* comment) override {
+        return RemoveFromList(*this, prop::Component_UserComments, comment);
+    }
+    HRESULT AppendAttribute(aafCharacter_constptr name, aafCharacter_constptr value) override {
+        return AppendTaggedText(*this, prop::Component_Attributes, name, value);
+    }
+    HRESULT CountAttributes(aafUInt32* numAttributes) override {
+        return ReadCount(prop::Component_Attributes, numAttributes);
+    }
+    HRESULT GetAttributes(IEnumAAFTaggedValues** enumerator) override {
+        return EnumerateList<IAAFTaggedValue>(this, prop::Component_Attributes, enumerator);
+    }
     HRESULT RemoveAttribute(IAAFTaggedValue* attribute) override;
 };
 

@@ -2,8 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/DigitalImageDescriptor.h"
 
-#include "aaf_library/objects/Arrays.h"
-
 namespace aaf {
 
 namespace {
@@ -103,16 +101,6 @@ HRESULT DigitalImageDescriptor::SetVideoLineMap(aafUInt32 numberElements, aafInt
     }
     return PutNative(prop::DigitalImageDescriptor_VideoLineMap, videoLineMap,
                      std::size_t{numberElements} * sizeof *videoLineMap);
-}
-
-HRESULT DigitalImageDescriptor::GetVideoLineMap(aafUInt32 numberElements, aafInt32* videoLineMap) {
-    return ReadArray(*this, prop::DigitalImageDescriptor_VideoLineMap, videoLineMap,
-                     std::size_t{numberElements} * sizeof *videoLineMap);
-}
-
-HRESULT DigitalImageDescriptor::GetVideoLineMapSize(aafUInt32* numberElements) {
-    return CountElements(*this, prop::DigitalImageDescriptor_VideoLineMap, sizeof(aafInt32),
-                         numberElements);
 }
 
 HRESULT DigitalImageDescriptor::SetFieldDominance(aafFieldNumber_t fieldDominance) {

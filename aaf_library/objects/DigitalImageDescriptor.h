@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/objects/Arrays.h"
 #include "aaf_library/objects/Checks.h"
 #include "aaf_library/objects/FileDescriptor.h"
 #include "not_implemented/AAFPictureDescriptors.h"
@@ -29,8 +30,14 @@ public:
 
     // An empty map leaves the stored one as it was.
     HRESULT SetVideoLineMap(aafUInt32 numberElements, aafInt32* videoLineMap) override;
-    HRESULT GetVideoLineMap(aafUInt32 numberElements, aafInt32* videoLineMap) override;
-    HRESULT GetVideoLineMapSize(aafUInt32* numberElements) override;
+    HRESULT GetVideoLineMap(aafUInt32 numberElements, aafInt32* videoLineMap) override {
+        return ReadArray(*this, prop::DigitalImageDescriptor_VideoLineMap, videoLineMap,
+                         std::size_t{numberElements} * sizeof *videoLineMap);
+    }
+    HRESULT GetVideoLineMapSize(aafUInt32* numberElements) override {
+        return CountElements(*this, prop::DigitalImageDescriptor_VideoLineMap, sizeof(aafInt32),
+                             numberElements);
+    }
 
     HRESULT SetFieldDominance(aafFieldNumber_t fieldDominance) override;
     HRESULT GetFieldDominance(aafFieldNumber_t* fieldDominance) override {

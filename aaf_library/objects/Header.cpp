@@ -2,15 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/Header.h"
 
-#include "aaf_library/model/Enumerator.h"
 #include "aaf_library/model/Model.h"
 #include "aaf_library/objects/ContentStorage.h"
-#include "aaf_library/objects/Fresh.h"
 #include "aaf_library/objects/Identification.h"
-#include "host_interfaces/aaf/AAFClassIds.h"
-#include "host_interfaces/aaf/AAFDictionary.h"
-#include "host_interfaces/aaf/AAFEssenceData.h"
-#include "host_interfaces/aaf/AAFMobs.h"
 
 namespace aaf {
 
@@ -137,24 +131,8 @@ HRESULT Header::LookupIdentification(aafUID_constref generation,
     return AAFRESULT_OBJECT_NOT_FOUND;
 }
 
-HRESULT Header::CountIdentifications(aafUInt32* result) {
-    return ReadCount(prop::Header_IdentificationList, result);
-}
-
 HRESULT Header::GetIdentifications(IEnumAAFIdentifications** enumerator) {
     return MakeEnumerator<IAAFIdentification>(this, prop::Header_IdentificationList, enumerator);
-}
-
-HRESULT Header::AppendIdentification(IAAFIdentification* ident) {
-    return AppendObject(prop::Header_IdentificationList, ident);
-}
-
-HRESULT Header::GetIdentificationAt(aafUInt32 index, IAAFIdentification** identification) {
-    return ReadObjectAt(prop::Header_IdentificationList, index, identification);
-}
-
-HRESULT Header::GetDictionary(IAAFDictionary** dictionary) {
-    return Object::GetDictionary(dictionary);
 }
 
 HRESULT Header::GetRefImplVersion(aafProductVersion_t* version) {
@@ -163,18 +141,6 @@ HRESULT Header::GetRefImplVersion(aafProductVersion_t* version) {
     }
     *version = LibraryVersion();
     return AAFRESULT_SUCCESS;
-}
-
-HRESULT Header::GetFileRevision(aafVersionType_t* revision) {
-    return ReadStruct(prop::Header_Version, revision);
-}
-
-HRESULT Header::GetLastModified(aafTimeStamp_t* timeStamp) {
-    return ReadStruct(prop::Header_LastModified, timeStamp);
-}
-
-HRESULT Header::GetContentStorage(IAAFContentStorage** storage) {
-    return ReadObject(prop::Header_Content, storage);
 }
 
 HRESULT Header::GetStoredByteOrder(eAAFByteOrder_t* order) {
@@ -197,14 +163,6 @@ HRESULT Header::GetNativeByteOrder(eAAFByteOrder_t* order) {
     const bool little = *reinterpret_cast<const aafUInt8*>(&probe) == 1;
     *order = little ? kAAFByteOrderLittle : kAAFByteOrderBig;
     return AAFRESULT_SUCCESS;
-}
-
-HRESULT Header::GetOperationalPattern(aafUID_t* operationalPatternID) {
-    return ReadStruct(prop::Header_OperationalPattern, operationalPatternID);
-}
-
-HRESULT Header::SetOperationalPattern(aafUID_constref operationalPatternID) {
-    return PutStruct(prop::Header_OperationalPattern, operationalPatternID);
 }
 
 }  // namespace aaf

@@ -2,8 +2,14 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/model/Enumerator.h"
 #include "aaf_library/model/Object.h"
+#include "aaf_library/objects/Fresh.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFEssenceData.h"
 #include "host_interfaces/aaf/AAFFile.h"
+#include "host_interfaces/aaf/AAFMobs.h"
 #include "not_implemented/AAFFile.h"
 
 namespace aaf {
@@ -42,21 +48,39 @@ public:
     HRESULT GetLastIdentification(IAAFIdentification** identification) override;
     HRESULT LookupIdentification(aafUID_constref generation,
                                  IAAFIdentification** identification) override;
-    HRESULT CountIdentifications(aafUInt32* result) override;
+    HRESULT CountIdentifications(aafUInt32* result) override {
+        return ReadCount(prop::Header_IdentificationList, result);
+    }
     HRESULT GetIdentifications(IEnumAAFIdentifications** enumerator) override;
-    HRESULT AppendIdentification(IAAFIdentification* ident) override;
-    HRESULT GetIdentificationAt(aafUInt32 index, IAAFIdentification** identification) override;
+    HRESULT AppendIdentification(IAAFIdentification* ident) override {
+        return AppendObject(prop::Header_IdentificationList, ident);
+    }
+    HRESULT GetIdentificationAt(aafUInt32 index, IAAFIdentification** identification) override {
+        return ReadObjectAt(prop::Header_IdentificationList, index, identification);
+    }
 
     // -- The file as such
-    HRESULT GetDictionary(IAAFDictionary** dictionary) override;
+    HRESULT GetDictionary(IAAFDictionary** dictionary) override {
+        return Object::GetDictionary(dictionary);
+    }
     HRESULT GetRefImplVersion(aafProductVersion_t* version) override;
-    HRESULT GetFileRevision(aafVersionType_t* revision) override;
-    HRESULT GetLastModified(aafTimeStamp_t* timeStamp) override;
-    HRESULT GetContentStorage(IAAFContentStorage** storage) override;
+    HRESULT GetFileRevision(aafVersionType_t* revision) override {
+        return ReadStruct(prop::Header_Version, revision);
+    }
+    HRESULT GetLastModified(aafTimeStamp_t* timeStamp) override {
+        return ReadStruct(prop::Header_LastModified, timeStamp);
+    }
+    HRESULT GetContentStorage(IAAFContentStorage** storage) override {
+        return ReadObject(prop::Header_Content, storage);
+    }
     HRESULT GetStoredByteOrder(eAAFByteOrder_t* order) override;
     HRESULT GetNativeByteOrder(eAAFByteOrder_t* order) override;
-    HRESULT GetOperationalPattern(aafUID_t* operationalPatternID) override;
-    HRESULT SetOperationalPattern(aafUID_constref operationalPatternID) override;
+    HRESULT GetOperationalPattern(aafUID_t* operationalPatternID) override {
+        return ReadStruct(prop::Header_OperationalPattern, operationalPatternID);
+    }
+    HRESULT SetOperationalPattern(aafUID_constref operationalPatternID) override {
+        return PutStruct(prop::Header_OperationalPattern, operationalPatternID);
+    }
 
 private:
     template <class Operation>

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/Identification.h"
 
-#include "aaf_library/objects/Fresh.h"
 #include "aaf_library/objects/Header.h"
 
 namespace aaf {
@@ -49,59 +48,6 @@ HRESULT Identification::Initialize(aafCharacter_constptr companyName,
     PutStruct(prop::Identification_ToolkitVersion, LibraryVersion());
     PutString(prop::Identification_Platform, kPlatform);
     return PutStruct(prop::Identification_GenerationAUID, NewGenerationId());
-}
-
-HRESULT Identification::GetCompanyName(aafCharacter* companyName, aafUInt32 bufSize) {
-    return ReadString(prop::Identification_CompanyName, companyName, bufSize);
-}
-
-HRESULT Identification::GetCompanyNameBufLen(aafUInt32* bufSize) {
-    return ReadStringLength(prop::Identification_CompanyName, bufSize);
-}
-
-HRESULT Identification::GetProductName(aafCharacter* productName, aafUInt32 bufSize) {
-    return ReadString(prop::Identification_ProductName, productName, bufSize);
-}
-
-HRESULT Identification::GetProductNameBufLen(aafUInt32* bufSize) {
-    return ReadStringLength(prop::Identification_ProductName, bufSize);
-}
-
-HRESULT Identification::GetProductVersionString(aafCharacter* productVersionString,
-                                                aafUInt32 bufSize) {
-    return ReadString(prop::Identification_ProductVersionString, productVersionString, bufSize);
-}
-
-HRESULT Identification::GetProductVersionStringBufLen(aafUInt32* bufSize) {
-    return ReadStringLength(prop::Identification_ProductVersionString, bufSize);
-}
-
-HRESULT Identification::GetProductVersion(aafProductVersion_t* version) {
-    return ReadStruct(prop::Identification_ProductVersion, version);
-}
-
-HRESULT Identification::SetProductVersion(aafProductVersion_constref version) {
-    return PutStruct(prop::Identification_ProductVersion, version);
-}
-
-HRESULT Identification::GetProductID(aafUID_t* productID) {
-    return ReadStruct(prop::Identification_ProductID, productID);
-}
-
-HRESULT Identification::GetDate(aafTimeStamp_t* timestamp) {
-    return ReadStruct(prop::Identification_Date, timestamp);
-}
-
-HRESULT Identification::GetRefImplVersion(aafProductVersion_t* version) {
-    return ReadStruct(prop::Identification_ToolkitVersion, version);
-}
-
-HRESULT Identification::GetPlatform(aafCharacter* platform, aafUInt32 bufSize) {
-    return ReadString(prop::Identification_Platform, platform, bufSize);
-}
-
-HRESULT Identification::GetPlatformBufLen(aafUInt32* bufSize) {
-    return ReadStringLength(prop::Identification_Platform, bufSize);
 }
 
 HRESULT Identification::GetGenerationID(aafUID_t* generation) {

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "aaf_library/model/Object.h"
+#include "aaf_library/objects/Fresh.h"
 #include "host_interfaces/aaf/AAFFile.h"
 #include "not_implemented/AAFFile.h"
 
@@ -19,19 +20,46 @@ public:
     HRESULT Initialize(aafCharacter_constptr companyName, aafCharacter_constptr productName,
                        aafCharacter_constptr productVersionString,
                        aafUID_constref productID) override;
-    HRESULT GetCompanyName(aafCharacter* companyName, aafUInt32 bufSize) override;
-    HRESULT GetCompanyNameBufLen(aafUInt32* bufSize) override;
-    HRESULT GetProductName(aafCharacter* productName, aafUInt32 bufSize) override;
-    HRESULT GetProductNameBufLen(aafUInt32* bufSize) override;
-    HRESULT GetProductVersionString(aafCharacter* productVersionString, aafUInt32 bufSize) override;
-    HRESULT GetProductVersionStringBufLen(aafUInt32* bufSize) override;
-    HRESULT GetProductVersion(aafProductVersion_t* version) override;
-    HRESULT SetProductVersion(aafProductVersion_constref version) override;
-    HRESULT GetProductID(aafUID_t* productID) override;
-    HRESULT GetDate(aafTimeStamp_t* timestamp) override;
-    HRESULT GetRefImplVersion(aafProductVersion_t* version) override;
-    HRESULT GetPlatform(aafCharacter* platform, aafUInt32 bufSize) override;
-    HRESULT GetPlatformBufLen(aafUInt32* bufSize) override;
+    HRESULT GetCompanyName(aafCharacter* companyName, aafUInt32 bufSize) override {
+        return ReadString(prop::Identification_CompanyName, companyName, bufSize);
+    }
+    HRESULT GetCompanyNameBufLen(aafUInt32* bufSize) override {
+        return ReadStringLength(prop::Identification_CompanyName, bufSize);
+    }
+    HRESULT GetProductName(aafCharacter* productName, aafUInt32 bufSize) override {
+        return ReadString(prop::Identification_ProductName, productName, bufSize);
+    }
+    HRESULT GetProductNameBufLen(aafUInt32* bufSize) override {
+        return ReadStringLength(prop::Identification_ProductName, bufSize);
+    }
+    HRESULT GetProductVersionString(aafCharacter* productVersionString,
+                                    aafUInt32 bufSize) override {
+        return ReadString(prop::Identification_ProductVersionString, productVersionString, bufSize);
+    }
+    HRESULT GetProductVersionStringBufLen(aafUInt32* bufSize) override {
+        return ReadStringLength(prop::Identification_ProductVersionString, bufSize);
+    }
+    HRESULT GetProductVersion(aafProductVersion_t* version) override {
+        return ReadStruct(prop::Identification_ProductVersion, version);
+    }
+    HRESULT SetProductVersion(aafProductVersion_constref version) override {
+        return PutStruct(prop::Identification_ProductVersion, version);
+    }
+    HRESULT GetProductID(aafUID_t* productID) override {
+        return ReadStruct(prop::Identification_ProductID, productID);
+    }
+    HRESULT GetDate(aafTimeStamp_t* timestamp) override {
+        return ReadStruct(prop::Identification_Date, timestamp);
+    }
+    HRESULT GetRefImplVersion(aafProductVersion_t* version) override {
+        return ReadStruct(prop::Identification_ToolkitVersion, version);
+    }
+    HRESULT GetPlatform(aafCharacter* platform, aafUInt32 bufSize) override {
+        return ReadString(prop::Identification_Platform, platform, bufSize);
+    }
+    HRESULT GetPlatformBufLen(aafUInt32* bufSize) override {
+        return ReadStringLength(prop::Identification_Platform, bufSize);
+    }
     HRESULT GetGenerationID(aafUID_t* generation) override;
 };
 

@@ -2,16 +2,10 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/Mob.h"
 
-#include "aaf_library/model/Enumerator.h"
-#include "aaf_library/objects/Annotations.h"
 #include "aaf_library/objects/ContentStorage.h"
-#include "aaf_library/objects/Fresh.h"
-#include "aaf_library/objects/MobId.h"
 #include "aaf_library/objects/MobSlot.h"
-#include "host_interfaces/aaf/AAFComponents.h"
-#include "host_interfaces/aaf/AAFEffects.h"
-#include "host_interfaces/aaf/AAFEvents.h"
-#include "host_interfaces/aaf/AAFTimecodes.h"
+
+#include "aaf_library/objects/SourceMob.h"
 
 namespace aaf {
 
@@ -55,10 +49,6 @@ void Mob::OnValueChange(const PropertyValue& value) {
     }
 }
 
-HRESULT Mob::GetMobID(aafMobID_t* mobID) {
-    return ReadStruct(prop::Mob_MobID, mobID);
-}
-
 HRESULT Mob::SetMobID(aafMobID_constref mobID) {
     ContentStorage* const storage = dynamic_cast<ContentStorage*>(owner());
     if (storage == nullptr) {
@@ -70,34 +60,6 @@ HRESULT Mob::SetMobID(aafMobID_constref mobID) {
     const HRESULT result = PutStruct(prop::Mob_MobID, mobID);
     storage->SortSet(prop::ContentStorage_Mobs);
     return result;
-}
-
-HRESULT Mob::SetName(aafCharacter_constptr name) {
-    return PutString(prop::Mob_Name, name);
-}
-
-HRESULT Mob::GetName(aafCharacter* name, aafUInt32 bufSize) {
-    return ReadString(prop::Mob_Name, name, bufSize);
-}
-
-HRESULT Mob::GetNameBufLen(aafUInt32* bufSize) {
-    return ReadStringLength(prop::Mob_Name, bufSize);
-}
-
-HRESULT Mob::GetModTime(aafTimeStamp_t* lastModified) {
-    return ReadStruct(prop::Mob_LastModified, lastModified);
-}
-
-HRESULT Mob::SetModTime(aafTimeStamp_constref modTime) {
-    return PutStruct(prop::Mob_LastModified, modTime);
-}
-
-HRESULT Mob::GetCreateTime(aafTimeStamp_t* creationTime) {
-    return ReadStruct(prop::Mob_CreationTime, creationTime);
-}
-
-HRESULT Mob::SetCreateTime(aafTimeStamp_constref createTime) {
-    return PutStruct(prop::Mob_CreationTime, createTime);
 }
 
 HRESULT Mob::GetMobInfo(aafTimeStamp_t* lastModified, aafTimeStamp_t* creationTime,
@@ -113,38 +75,6 @@ HRESULT Mob::GetMobInfo(aafTimeStamp_t* lastModified, aafTimeStamp_t* creationTi
     return GetCreateTime(creationTime);
 }
 
-HRESULT Mob::SetUsageCode(aafUID_constref usageCode) {
-    return PutStruct(prop::Mob_UsageCode, usageCode);
-}
-
-HRESULT Mob::GetUsageCode(aafUID_t* usageCode) {
-    return ReadStruct(prop::Mob_UsageCode, usageCode);
-}
-
-HRESULT Mob::CountSlots(aafNumSlots_t* numSlots) {
-    return ReadCount(prop::Mob_Slots, numSlots);
-}
-
-HRESULT Mob::AppendSlot(IAAFMobSlot* slot) {
-    return AppendObject(prop::Mob_Slots, slot);
-}
-
-HRESULT Mob::PrependSlot(IAAFMobSlot* slot) {
-    return PrependObject(prop::Mob_Slots, slot);
-}
-
-HRESULT Mob::InsertSlotAt(aafUInt32 index, IAAFMobSlot* slot) {
-    return InsertObjectAt(prop::Mob_Slots, index, slot);
-}
-
-HRESULT Mob::RemoveSlotAt(aafUInt32 index) {
-    return RemoveObjectAt(prop::Mob_Slots, index);
-}
-
-HRESULT Mob::GetSlotAt(aafUInt32 index, IAAFMobSlot** slot) {
-    return ReadObjectAt(prop::Mob_Slots, index, slot);
-}
-
 HRESULT Mob::GetSlots(IEnumAAFMobSlots** enumerator) {
     return MakeEnumerator<IAAFMobSlot>(this, prop::Mob_Slots, enumerator);
 }
@@ -156,54 +86,6 @@ HRESULT Mob::LookupSlot(aafSlotID_t slotId, IAAFMobSlot** destSlot) {
     *destSlot = nullptr;
     MobSlot* const slot = FindSlot(slotId);
     return slot == nullptr ? AAFRESULT_SLOT_NOT_FOUND : GiveOut(slot, destSlot);
-}
-
-HRESULT Mob::AppendComment(aafCharacter* category, aafCharacter_constptr comment) {
-    return AppendTaggedText(*this, prop::Mob_UserComments, category, comment);
-}
-
-HRESULT Mob::CountComments(aafUInt32* numComments) {
-    return ReadCount(prop::Mob_UserComments, numComments);
-}
-
-HRESULT Mob::GetComments(IEnumAAFTaggedValues** enumerator) {
-    return EnumerateList<IAAFTaggedValue>(this, prop::Mob_UserComments, enumerator);
-}
-
-HRESULT Mob::RemoveComment(IAAFTaggedValue* comment) {
-    return RemoveFromList(*this, prop::Mob_UserComments, comment);
-}
-
-HRESULT Mob::AppendAttribute(aafCharacter_constptr name, aafCharacter_constptr value) {
-    return AppendTaggedText(*this, prop::Mob_Attributes, name, value);
-}
-
-HRESULT Mob::CountAttributes(aafUInt32* numAttributes) {
-    return ReadCount(prop::Mob_Attributes, numAttributes);
-}
-
-HRESULT Mob::GetAttributes(IEnumAAFTaggedValues** enumerator) {
-    return EnumerateList<IAAFTaggedValue>(this, prop::Mob_Attributes, enumerator);
-}
-
-HRESULT Mob::RemoveAttribute(IAAFTaggedValue* attribute) {
-    return RemoveFromList(*this, prop::Mob_Attributes, attribute);
-}
-
-HRESULT Mob::AppendKLVData(IAAFKLVData* data) {
-    return AppendObject(prop::Mob_KLVData, data);
-}
-
-HRESULT Mob::CountKLVData(aafUInt32* numData) {
-    return ReadCount(prop::Mob_KLVData, numData);
-}
-
-HRESULT Mob::GetKLVData(IEnumAAFKLVData** enumerator) {
-    return EnumerateList<IAAFKLVData>(this, prop::Mob_KLVData, enumerator);
-}
-
-HRESULT Mob::RemoveKLVData(IAAFKLVData* data) {
-    return RemoveFromList(*this, prop::Mob_KLVData, data);
 }
 
 }  // namespace aaf

@@ -2,13 +2,21 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <unordered_map>
-
+#include "aaf_library/model/Enumerator.h"
 #include "aaf_library/model/Object.h"
+#include "aaf_library/objects/Annotations.h"
+#include "aaf_library/objects/Fresh.h"
+#include "aaf_library/objects/MobId.h"
+#include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFEffects.h"
+#include "host_interfaces/aaf/AAFEvents.h"
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFMobs.h"
+#include "host_interfaces/aaf/AAFTimecodes.h"
 #include "not_implemented/AAFMobSlots.h"
 #include "not_implemented/AAFMobs.h"
+
+#include <unordered_map>
 
 namespace aaf {
 
@@ -31,27 +39,51 @@ public:
     void OnValueChange(const PropertyValue& value) override;
 
     // -- IAAFMob: identity
-    HRESULT GetMobID(aafMobID_t* mobID) override;
+    HRESULT GetMobID(aafMobID_t* mobID) override { return ReadStruct(prop::Mob_MobID, mobID); }
     HRESULT SetMobID(aafMobID_constref mobID) override;
-    HRESULT SetName(aafCharacter_constptr name) override;
-    HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) override;
-    HRESULT GetNameBufLen(aafUInt32* bufSize) override;
-    HRESULT GetModTime(aafTimeStamp_t* lastModified) override;
-    HRESULT SetModTime(aafTimeStamp_constref modTime) override;
-    HRESULT GetCreateTime(aafTimeStamp_t* creationTime) override;
-    HRESULT SetCreateTime(aafTimeStamp_constref createTime) override;
+    HRESULT SetName(aafCharacter_constptr name) override { return PutString(prop::Mob_Name, name); }
+    HRESULT GetName(aafCharacter* name, aafUInt32 bufSize) override {
+        return ReadString(prop::Mob_Name, name, bufSize);
+    }
+    HRESULT GetNameBufLen(aafUInt32* bufSize) override {
+        return ReadStringLength(prop::Mob_Name, bufSize);
+    }
+    HRESULT GetModTime(aafTimeStamp_t* lastModified) override {
+        return ReadStruct(prop::Mob_LastModified, lastModified);
+    }
+    HRESULT SetModTime(aafTimeStamp_constref modTime) override {
+        return PutStruct(prop::Mob_LastModified, modTime);
+    }
+    HRESULT GetCreateTime(aafTimeStamp_t* creationTime) override {
+        return ReadStruct(prop::Mob_CreationTime, creationTime);
+    }
+    HRESULT SetCreateTime(aafTimeStamp_constref createTime) override {
+        return PutStruct(prop::Mob_CreationTime, createTime);
+    }
     HRESULT GetMobInfo(aafTimeStamp_t* lastModified, aafTimeStamp_t* creationTime,
                        aafCharacter* name, aafInt32 bufSize) override;
-    HRESULT SetUsageCode(aafUID_constref usageCode) override;
-    HRESULT GetUsageCode(aafUID_t* usageCode) override;
+    HRESULT SetUsageCode(aafUID_constref usageCode) override {
+        return PutStruct(prop::Mob_UsageCode, usageCode);
+    }
+    HRESULT GetUsageCode(aafUID_t* usageCode) override {
+        return ReadStruct(prop::Mob_UsageCode, usageCode);
+    }
 
     // -- Slots. Their ids are never checked.
-    HRESULT CountSlots(aafNumSlots_t* numSlots) override;
-    HRESULT AppendSlot(IAAFMobSlot* slot) override;
-    HRESULT PrependSlot(IAAFMobSlot* slot) override;
-    HRESULT InsertSlotAt(aafUInt32 index, IAAFMobSlot* slot) override;
-    HRESULT RemoveSlotAt(aafUInt32 index) override;
-    HRESULT GetSlotAt(aafUInt32 index, IAAFMobSlot** slot) override;
+    HRESULT CountSlots(aafNumSlots_t* numSlots) override {
+        return ReadCount(prop::Mob_Slots, numSlots);
+    }
+    HRESULT AppendSlot(IAAFMobSlot* slot) override { return AppendObject(prop::Mob_Slots, slot); }
+    HRESULT PrependSlot(IAAFMobSlot* slot) override { return PrependObject(prop::Mob_Slots, slot); }
+    HRESULT InsertSlotAt(aafUInt32 index, IAAFMobSlot* slot) override {
+        return InsertObjectAt(prop::Mob_Slots, index, slot);
+    }
+    HRESULT RemoveSlotAt(aafUInt32 index) override {
+        return RemoveObjectAt(prop::Mob_Slots, index);
+    }
+    HRESULT GetSlotAt(aafUInt32 index, IAAFMobSlot** slot) override {
+        return ReadObjectAt(prop::Mob_Slots, index, slot);
+    }
     HRESULT GetSlots(IEnumAAFMobSlots** enumerator) override;
     HRESULT LookupSlot(aafSlotID_t slotId, IAAFMobSlot** destSlot) override;
     HRESULT AppendNewTimelineSlot(aafRational_t editRate, IAAFSegment* segment, aafSlotID_t slotID,
@@ -65,18 +97,42 @@ public:
                                IAAFEventMobSlot** newSlot) override;
 
     // -- Comments, attributes, raw data
-    HRESULT AppendComment(aafCharacter* category, aafCharacter_constptr comment) override;
-    HRESULT CountComments(aafUInt32* numComments) override;
-    HRESULT GetComments(IEnumAAFTaggedValues** enumerator) override;
-    HRESULT RemoveComment(IAAFTaggedValue* comment) override;
-    HRESULT AppendAttribute(aafCharacter_constptr name, aafCharacter_constptr value) override;
-    HRESULT CountAttributes(aafUInt32* numAttributes) override;
-    HRESULT GetAttributes(IEnumAAFTaggedValues** enumerator) override;
-    HRESULT RemoveAttribute(IAAFTaggedValue* attribute) override;
-    HRESULT AppendKLVData(IAAFKLVData* data) override;
-    HRESULT CountKLVData(aafUInt32* numData) override;
-    HRESULT GetKLVData(IEnumAAFKLVData** enumerator) override;
-    HRESULT RemoveKLVData(IAAFKLVData* data) override;
+    HRESULT AppendComment(aafCharacter* category, aafCharacter_constptr comment) override {
+        return AppendTaggedText(*this, prop::Mob_UserComments, category, comment);
+    }
+    HRESULT CountComments(aafUInt32* numComments) override {
+        return ReadCount(prop::Mob_UserComments, numComments);
+    }
+    HRESULT GetComments(IEnumAAFTaggedValues** enumerator) override {
+        return EnumerateList<IAAFTaggedValue>(this, prop::Mob_UserComments, enumerator);
+    }
+    HRESULT RemoveComment(IAAFTaggedValue* comment) override {
+        return RemoveFromList(*this, prop::Mob_UserComments, comment);
+    }
+    HRESULT AppendAttribute(aafCharacter_constptr name, aafCharacter_constptr value) override {
+        return AppendTaggedText(*this, prop::Mob_Attributes, name, value);
+    }
+    HRESULT CountAttributes(aafUInt32* numAttributes) override {
+        return ReadCount(prop::Mob_Attributes, numAttributes);
+    }
+    HRESULT GetAttributes(IEnumAAFTaggedValues** enumerator) override {
+        return EnumerateList<IAAFTaggedValue>(this, prop::Mob_Attributes, enumerator);
+    }
+    HRESULT RemoveAttribute(IAAFTaggedValue* attribute) override {
+        return RemoveFromList(*this, prop::Mob_Attributes, attribute);
+    }
+    HRESULT AppendKLVData(IAAFKLVData* data) override {
+        return AppendObject(prop::Mob_KLVData, data);
+    }
+    HRESULT CountKLVData(aafUInt32* numData) override {
+        return ReadCount(prop::Mob_KLVData, numData);
+    }
+    HRESULT GetKLVData(IEnumAAFKLVData** enumerator) override {
+        return EnumerateList<IAAFKLVData>(this, prop::Mob_KLVData, enumerator);
+    }
+    HRESULT RemoveKLVData(IAAFKLVData* data) override {
+        return RemoveFromList(*this, prop::Mob_KLVData, data);
+    }
 
     // -- Other mobs and files
     HRESULT ChangeRef(aafMobID_constref oldMobID, aafMobID_constref newMobID) override;

@@ -2,13 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/OtherComponents.h"
 
-#include "aaf_library/model/Enumerator.h"
-#include "aaf_library/objects/Annotations.h"
-#include "aaf_library/objects/Checks.h"
-#include "host_interfaces/aaf/AAFClassIds.h"
-#include "host_interfaces/aaf/AAFDefinitions.h"
-#include "host_interfaces/aaf/AAFEffectDefinitions.h"
-
 namespace aaf {
 
 namespace {
@@ -48,18 +41,6 @@ HRESULT Transition::Initialize(IAAFDataDef* dataDef, aafLength_t length, aafPosi
     return result < 0 ? result : SetCutPoint(cutPoint);
 }
 
-HRESULT Transition::GetCutPoint(aafPosition_t* cutPoint) {
-    return ReadInteger(prop::Transition_CutPoint, cutPoint);
-}
-
-HRESULT Transition::GetOperationGroup(IAAFOperationGroup** groupObj) {
-    return ReadObject(prop::Transition_OperationGroup, groupObj);
-}
-
-HRESULT Transition::SetCutPoint(aafPosition_t cutPoint) {
-    return PutInteger(prop::Transition_CutPoint, cutPoint);
-}
-
 HRESULT Transition::SetOperationGroup(IAAFOperationGroup* opgroup) {
     return PutObject(prop::Transition_OperationGroup, opgroup);
 }
@@ -76,66 +57,6 @@ HRESULT OperationGroup::Initialize(IAAFDataDef* dataDef, aafLength_t length,
         result = SetLength(length);
     }
     return result < 0 ? result : SetOperationDefinition(operationDef);
-}
-
-HRESULT OperationGroup::GetOperationDefinition(IAAFOperationDef** operationDef) {
-    return ReadWeak(prop::OperationGroup_Operation, operationDef);
-}
-
-HRESULT OperationGroup::SetOperationDefinition(IAAFOperationDef* operationDef) {
-    return PutWeak(prop::OperationGroup_Operation, operationDef);
-}
-
-HRESULT OperationGroup::GetRender(IAAFSourceReference** sourceRef) {
-    return ReadObject(prop::OperationGroup_Rendering, sourceRef);
-}
-
-HRESULT OperationGroup::SetRender(IAAFSourceReference* sourceRef) {
-    return PutObject(prop::OperationGroup_Rendering, sourceRef);
-}
-
-HRESULT OperationGroup::GetBypassOverride(aafUInt32* bypassOverride) {
-    return ReadInteger(prop::OperationGroup_BypassOverride, bypassOverride);
-}
-
-HRESULT OperationGroup::SetBypassOverride(aafUInt32 bypassOverride) {
-    return PutInteger(prop::OperationGroup_BypassOverride, bypassOverride);
-}
-
-HRESULT OperationGroup::CountSourceSegments(aafUInt32* result) {
-    return ReadCount(prop::OperationGroup_InputSegments, result);
-}
-
-HRESULT OperationGroup::AppendInputSegment(IAAFSegment* segment) {
-    return AppendObject(prop::OperationGroup_InputSegments, segment);
-}
-
-HRESULT OperationGroup::PrependInputSegment(IAAFSegment* segment) {
-    return PrependObject(prop::OperationGroup_InputSegments, segment);
-}
-
-HRESULT OperationGroup::InsertInputSegmentAt(aafUInt32 index, IAAFSegment* segment) {
-    return InsertObjectAt(prop::OperationGroup_InputSegments, index, segment);
-}
-
-HRESULT OperationGroup::GetInputSegmentAt(aafUInt32 index, IAAFSegment** inputSegment) {
-    return ReadObjectAt(prop::OperationGroup_InputSegments, index, inputSegment);
-}
-
-HRESULT OperationGroup::RemoveInputSegmentAt(aafUInt32 index) {
-    return RemoveObjectAt(prop::OperationGroup_InputSegments, index);
-}
-
-HRESULT OperationGroup::CountParameters(aafUInt32* result) {
-    return ReadCount(prop::OperationGroup_Parameters, result);
-}
-
-HRESULT OperationGroup::AddParameter(IAAFParameter* parameter) {
-    return AppendObject(prop::OperationGroup_Parameters, parameter);
-}
-
-HRESULT OperationGroup::GetParameters(IEnumAAFParameters** enumerator) {
-    return EnumerateList<IAAFParameter>(this, prop::OperationGroup_Parameters, enumerator);
 }
 
 HRESULT OperationGroup::LookupParameter(aafArgIDType_constref argID, IAAFParameter** parameter) {
@@ -167,36 +88,12 @@ HRESULT ConstantValue::GetTypeDefinition(IAAFTypeDef** typeDef) {
     return ReadIndirectType(prop::ConstantValue_Value, typeDef);
 }
 
-HRESULT VaryingValue::AddControlPoint(IAAFControlPoint* controlPoint) {
-    return AppendObject(prop::VaryingValue_PointList, controlPoint);
-}
-
 HRESULT VaryingValue::GetControlPoints(IEnumAAFControlPoints** enumerator) {
     return MakeEnumerator<IAAFControlPoint>(this, prop::VaryingValue_PointList, enumerator);
 }
 
-HRESULT VaryingValue::CountControlPoints(aafUInt32* result) {
-    return ReadCount(prop::VaryingValue_PointList, result);
-}
-
-HRESULT VaryingValue::GetControlPointAt(aafUInt32 index, IAAFControlPoint** controlPoint) {
-    return ReadObjectAt(prop::VaryingValue_PointList, index, controlPoint);
-}
-
 HRESULT VaryingValue::RemoveControlPointAt(aafUInt32 index) {
     return RemoveObjectAt(prop::VaryingValue_PointList, index);
-}
-
-HRESULT ControlPoint::GetTime(aafRational_t* time) {
-    return ReadStruct(prop::ControlPoint_Time, time);
-}
-
-HRESULT ControlPoint::SetTime(aafRational_t time) {
-    return PutStruct(prop::ControlPoint_Time, time);
-}
-
-HRESULT ControlPoint::GetEditHint(aafEditHint_t* editHint) {
-    return ReadInteger(prop::ControlPoint_EditHint, editHint);
 }
 
 HRESULT ControlPoint::SetEditHint(aafEditHint_t editHint) {
@@ -220,30 +117,6 @@ HRESULT ControlPoint::GetTypeDefinition(IAAFTypeDef** typeDef) {
 
 // NestedScope and ScopeReference
 
-HRESULT NestedScope::AppendSegment(IAAFSegment* segment) {
-    return AppendObject(prop::NestedScope_Slots, segment);
-}
-
-HRESULT NestedScope::PrependSegment(IAAFSegment* segment) {
-    return PrependObject(prop::NestedScope_Slots, segment);
-}
-
-HRESULT NestedScope::InsertSegmentAt(aafUInt32 index, IAAFSegment* segment) {
-    return InsertObjectAt(prop::NestedScope_Slots, index, segment);
-}
-
-HRESULT NestedScope::RemoveSegmentAt(aafUInt32 index) {
-    return RemoveObjectAt(prop::NestedScope_Slots, index);
-}
-
-HRESULT NestedScope::CountSegments(aafUInt32* result) {
-    return ReadCount(prop::NestedScope_Slots, result);
-}
-
-HRESULT NestedScope::GetSegmentAt(aafUInt32 index, IAAFSegment** segment) {
-    return ReadObjectAt(prop::NestedScope_Slots, index, segment);
-}
-
 HRESULT NestedScope::GetSegments(IEnumAAFSegments** enumerator) {
     return MakeEnumerator<IAAFSegment>(this, prop::NestedScope_Slots, enumerator);
 }
@@ -259,27 +132,11 @@ HRESULT ScopeReference::Create(aafUInt32 relativeScope, aafUInt32 relativeSlot) 
     return PutInteger(prop::ScopeReference_RelativeSlot, relativeSlot);
 }
 
-HRESULT ScopeReference::GetRelativeScope(aafUInt32* relativeScope) {
-    return ReadInteger(prop::ScopeReference_RelativeScope, relativeScope);
-}
-
 HRESULT ScopeReference::GetRelativeSlot(aafUInt32* relativeSlot) {
     return ReadInteger(prop::ScopeReference_RelativeSlot, relativeSlot);
 }
 
 // Selector and EssenceGroup
-
-HRESULT Selector::GetSelectedSegment(IAAFSegment** selected) {
-    return ReadObject(prop::Selector_Selected, selected);
-}
-
-HRESULT Selector::SetSelectedSegment(IAAFSegment* selected) {
-    return PutObject(prop::Selector_Selected, selected);
-}
-
-HRESULT Selector::AppendAlternateSegment(IAAFSegment* segment) {
-    return AppendObject(prop::Selector_Alternates, segment);
-}
 
 HRESULT Selector::GetNumAlternateSegments(aafInt32* numSegments) {
     if (numSegments == nullptr) {
@@ -289,40 +146,8 @@ HRESULT Selector::GetNumAlternateSegments(aafInt32* numSegments) {
     return AAFRESULT_SUCCESS;
 }
 
-HRESULT Selector::EnumAlternateSegments(IEnumAAFSegments** enumerator) {
-    return EnumerateList<IAAFSegment>(this, prop::Selector_Alternates, enumerator);
-}
-
 HRESULT Selector::RemoveAlternateSegment(IAAFSegment* segment) {
     return RemoveFromList(*this, prop::Selector_Alternates, segment);
-}
-
-HRESULT EssenceGroup::SetStillFrame(IAAFSourceClip* stillFrame) {
-    return PutObject(prop::EssenceGroup_StillFrame, stillFrame);
-}
-
-HRESULT EssenceGroup::GetStillFrame(IAAFSourceClip** stillFrame) {
-    return ReadObject(prop::EssenceGroup_StillFrame, stillFrame);
-}
-
-HRESULT EssenceGroup::AppendChoice(IAAFSegment* choice) {
-    return AppendObject(prop::EssenceGroup_Choices, choice);
-}
-
-HRESULT EssenceGroup::PrependChoice(IAAFSegment* choice) {
-    return PrependObject(prop::EssenceGroup_Choices, choice);
-}
-
-HRESULT EssenceGroup::InsertChoiceAt(aafUInt32 index, IAAFSegment* choice) {
-    return InsertObjectAt(prop::EssenceGroup_Choices, index, choice);
-}
-
-HRESULT EssenceGroup::CountChoices(aafUInt32* count) {
-    return ReadCount(prop::EssenceGroup_Choices, count);
-}
-
-HRESULT EssenceGroup::GetChoiceAt(aafUInt32 index, IAAFSegment** choice) {
-    return ReadObjectAt(prop::EssenceGroup_Choices, index, choice);
 }
 
 HRESULT EssenceGroup::RemoveChoiceAt(aafUInt32 index) {
@@ -331,27 +156,11 @@ HRESULT EssenceGroup::RemoveChoiceAt(aafUInt32 index) {
 
 // Pulldown
 
-HRESULT Pulldown::GetInputSegment(IAAFSegment** inputSegment) {
-    return ReadObject(prop::Pulldown_InputSegment, inputSegment);
-}
-
-HRESULT Pulldown::SetInputSegment(IAAFSegment* inputSegment) {
-    return PutObject(prop::Pulldown_InputSegment, inputSegment);
-}
-
-HRESULT Pulldown::GetPulldownKind(aafPulldownKind_t* pulldownKind) {
-    return ReadInteger(prop::Pulldown_PulldownKind, pulldownKind);
-}
-
 HRESULT Pulldown::SetPulldownKind(aafPulldownKind_t pulldownKind) {
     if (!IsWithin(pulldownKind, kAAFTwoThreePD, kAAFTwoToOnePD)) {
         return AAFRESULT_INVALID_ENUM_VALUE;
     }
     return PutInteger(prop::Pulldown_PulldownKind, pulldownKind);
-}
-
-HRESULT Pulldown::GetPulldownDirection(aafPulldownDir_t* direction) {
-    return ReadInteger(prop::Pulldown_PulldownDirection, direction);
 }
 
 HRESULT Pulldown::SetPulldownDirection(aafPulldownDir_t direction) {
@@ -361,46 +170,18 @@ HRESULT Pulldown::SetPulldownDirection(aafPulldownDir_t direction) {
     return PutInteger(prop::Pulldown_PulldownDirection, direction);
 }
 
-HRESULT Pulldown::GetPhaseFrame(aafPhaseFrame_t* phaseFrame) {
-    return ReadInteger(prop::Pulldown_PhaseFrame, phaseFrame);
-}
-
 HRESULT Pulldown::SetPhaseFrame(aafPhaseFrame_t phaseFrame) {
     return PutInteger(prop::Pulldown_PhaseFrame, phaseFrame);
 }
 
 // Events
 
-HRESULT Event::GetPosition(aafPosition_t* position) {
-    return ReadInteger(prop::Event_Position, position);
-}
-
-HRESULT Event::SetPosition(aafPosition_t position) {
-    return PutInteger(prop::Event_Position, position);
-}
-
-HRESULT Event::SetComment(aafCharacter_constptr comment) {
-    return PutString(prop::Event_Comment, comment);
-}
-
-HRESULT Event::GetComment(aafCharacter* comment, aafUInt32 bufSize) {
-    return ReadString(prop::Event_Comment, comment, bufSize);
-}
-
 HRESULT Event::GetCommentBufLen(aafUInt32* bufSize) {
     return ReadStringLength(prop::Event_Comment, bufSize);
 }
 
-HRESULT CommentMarker::GetAnnotation(IAAFSourceReference** result) {
-    return ReadObject(prop::CommentMarker_Annotation, result);
-}
-
 HRESULT CommentMarker::SetAnnotation(IAAFSourceReference* annotation) {
     return PutObject(prop::CommentMarker_Annotation, annotation);
-}
-
-HRESULT GPITrigger::GetActiveState(aafBoolean_t* activeState) {
-    return ReadInteger(prop::GPITrigger_ActiveState, activeState);
 }
 
 HRESULT GPITrigger::SetActiveState(aafBoolean_t activeState) {

@@ -2,11 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/Sequence.h"
 
-#include "aaf_library/model/Enumerator.h"
-#include "aaf_library/objects/Definitions.h"
 #include "aaf_library/objects/OtherComponents.h"
-#include "host_interfaces/aaf/AAFDefinitionIds.h"
-#include "host_interfaces/aaf/AAFDefinitions.h"
 
 namespace aaf {
 
@@ -73,10 +69,6 @@ bool SubtractLength(aafLength_t length, const Component& component, aafLength_t&
 
 }  // namespace
 
-HRESULT Sequence::Initialize(IAAFDataDef* dataDef) {
-    return SetDataDef(dataDef);
-}
-
 Component* Sequence::ComponentAt(aafUInt32 index) const {
     return dynamic_cast<Component*>(ObjectAt(prop::Sequence_Components, index));
 }
@@ -125,14 +117,6 @@ HRESULT Sequence::CheckNeighbours(const Component& component, aafUInt32 index) c
     return AAFRESULT_SUCCESS;
 }
 
-HRESULT Sequence::AppendComponent(IAAFComponent* component) {
-    return InsertComponentAt(CountObjects(prop::Sequence_Components), component);
-}
-
-HRESULT Sequence::PrependComponent(IAAFComponent* component) {
-    return InsertComponentAt(0, component);
-}
-
 HRESULT Sequence::InsertComponentAt(aafUInt32 index, IAAFComponent* component) {
     if (component == nullptr) {
         return AAFRESULT_NULL_PARAM;
@@ -165,10 +149,6 @@ HRESULT Sequence::InsertComponentAt(aafUInt32 index, IAAFComponent* component) {
     return result < 0 ? result : PutInteger(prop::Component_Length, sum);
 }
 
-HRESULT Sequence::GetComponentAt(aafUInt32 index, IAAFComponent** component) {
-    return ReadObjectAt(prop::Sequence_Components, index, component);
-}
-
 HRESULT Sequence::RemoveComponentAt(aafUInt32 index) {
     const Component* const removed = ComponentAt(index);
     if (removed == nullptr) {
@@ -180,10 +160,6 @@ HRESULT Sequence::RemoveComponentAt(aafUInt32 index) {
     }
     const HRESULT result = RemoveObjectAt(prop::Sequence_Components, index);
     return result < 0 ? result : PutInteger(prop::Component_Length, rest);
-}
-
-HRESULT Sequence::CountComponents(aafUInt32* result) {
-    return ReadCount(prop::Sequence_Components, result);
 }
 
 HRESULT Sequence::GetComponents(IEnumAAFComponents** enumerator) {

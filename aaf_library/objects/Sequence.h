@@ -2,7 +2,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/model/Enumerator.h"
 #include "aaf_library/objects/Component.h"
+#include "aaf_library/objects/Definitions.h"
+#include "host_interfaces/aaf/AAFDefinitionIds.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
 #include "not_implemented/AAFComponents.h"
 
 namespace aaf {
@@ -12,13 +16,21 @@ namespace aaf {
 // reach it.
 class Sequence : public Implements<Segment, IAAFSequence> {
 public:
-    HRESULT Initialize(IAAFDataDef* dataDef) override;
-    HRESULT AppendComponent(IAAFComponent* component) override;
-    HRESULT PrependComponent(IAAFComponent* component) override;
+    HRESULT Initialize(IAAFDataDef* dataDef) override { return SetDataDef(dataDef); }
+    HRESULT AppendComponent(IAAFComponent* component) override {
+        return InsertComponentAt(CountObjects(prop::Sequence_Components), component);
+    }
+    HRESULT PrependComponent(IAAFComponent* component) override {
+        return InsertComponentAt(0, component);
+    }
     HRESULT InsertComponentAt(aafUInt32 index, IAAFComponent* component) override;
-    HRESULT GetComponentAt(aafUInt32 index, IAAFComponent** component) override;
+    HRESULT GetComponentAt(aafUInt32 index, IAAFComponent** component) override {
+        return ReadObjectAt(prop::Sequence_Components, index, component);
+    }
     HRESULT RemoveComponentAt(aafUInt32 index) override;
-    HRESULT CountComponents(aafUInt32* result) override;
+    HRESULT CountComponents(aafUInt32* result) override {
+        return ReadCount(prop::Sequence_Components, result);
+    }
     HRESULT GetComponents(IEnumAAFComponents** enumerator) override;
 
 private:

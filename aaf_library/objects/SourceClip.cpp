@@ -2,59 +2,13 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/SourceClip.h"
 
-#include "aaf_library/objects/Arrays.h"
-#include "aaf_library/objects/Checks.h"
 #include "aaf_library/objects/ContentStorage.h"
-#include "aaf_library/objects/MobId.h"
-#include "host_interfaces/aaf/AAFDefinitions.h"
 
 namespace aaf {
 
 void SourceReference::SetDefaults() {
     Segment::SetDefaults();
     PutInteger(prop::SourceReference_SourceMobSlotID, 0);
-}
-
-HRESULT SourceReference::GetSourceID(aafMobID_t* sourceID) {
-    return ReadStruct(prop::SourceReference_SourceID, sourceID);
-}
-
-HRESULT SourceReference::SetSourceID(aafMobID_constref sourceID) {
-    return PutStruct(prop::SourceReference_SourceID, sourceID);
-}
-
-HRESULT SourceReference::GetSourceMobSlotID(aafSlotID_t* mobSlotID) {
-    return ReadInteger(prop::SourceReference_SourceMobSlotID, mobSlotID);
-}
-
-HRESULT SourceReference::SetSourceMobSlotID(aafSlotID_t mobSlotID) {
-    return PutInteger(prop::SourceReference_SourceMobSlotID, mobSlotID);
-}
-
-HRESULT SourceReference::SetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) {
-    return PutNative(prop::SourceReference_ChannelIDs, channelIDs,
-                     std::size_t{numberElements} * sizeof *channelIDs);
-}
-
-HRESULT SourceReference::GetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) {
-    return ReadArray(*this, prop::SourceReference_ChannelIDs, channelIDs,
-                     std::size_t{numberElements} * sizeof *channelIDs);
-}
-
-HRESULT SourceReference::GetChannelIDsSize(aafUInt32* size) {
-    return CountElements(*this, prop::SourceReference_ChannelIDs, sizeof(aafUInt32), size);
-}
-
-HRESULT SourceReference::SetMonoSourceSlotIDs(aafUInt32 numberElements,
-                                              aafUInt32* monoSourceSlotIDs) {
-    return PutNative(prop::SourceReference_MonoSourceSlotIDs, monoSourceSlotIDs,
-                     std::size_t{numberElements} * sizeof *monoSourceSlotIDs);
-}
-
-HRESULT SourceReference::GetMonoSourceSlotIDs(aafUInt32 numberElements,
-                                              aafUInt32* monoSourceSlotIDs) {
-    return ReadArray(*this, prop::SourceReference_MonoSourceSlotIDs, monoSourceSlotIDs,
-                     std::size_t{numberElements} * sizeof *monoSourceSlotIDs);
 }
 
 HRESULT SourceReference::GetMonoSourceSlotIDsSize(aafUInt32* size) {

@@ -2,7 +2,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/objects/Arrays.h"
+#include "aaf_library/objects/Checks.h"
 #include "aaf_library/objects/Component.h"
+#include "aaf_library/objects/MobId.h"
+#include "host_interfaces/aaf/AAFDefinitions.h"
 #include "not_implemented/AAFComponents.h"
 
 namespace aaf {
@@ -12,15 +16,37 @@ class SourceReference : public Implements<Segment, IAAFSourceReference, IAAFSour
 public:
     void SetDefaults() override;
 
-    HRESULT GetSourceID(aafMobID_t* sourceID) override;
-    HRESULT SetSourceID(aafMobID_constref sourceID) override;
-    HRESULT GetSourceMobSlotID(aafSlotID_t* mobSlotID) override;
-    HRESULT SetSourceMobSlotID(aafSlotID_t mobSlotID) override;
-    HRESULT SetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) override;
-    HRESULT GetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) override;
-    HRESULT GetChannelIDsSize(aafUInt32* size) override;
-    HRESULT SetMonoSourceSlotIDs(aafUInt32 numberElements, aafUInt32* monoSourceSlotIDs) override;
-    HRESULT GetMonoSourceSlotIDs(aafUInt32 numberElements, aafUInt32* monoSourceSlotIDs) override;
+    HRESULT GetSourceID(aafMobID_t* sourceID) override {
+        return ReadStruct(prop::SourceReference_SourceID, sourceID);
+    }
+    HRESULT SetSourceID(aafMobID_constref sourceID) override {
+        return PutStruct(prop::SourceReference_SourceID, sourceID);
+    }
+    HRESULT GetSourceMobSlotID(aafSlotID_t* mobSlotID) override {
+        return ReadInteger(prop::SourceReference_SourceMobSlotID, mobSlotID);
+    }
+    HRESULT SetSourceMobSlotID(aafSlotID_t mobSlotID) override {
+        return PutInteger(prop::SourceReference_SourceMobSlotID, mobSlotID);
+    }
+    HRESULT SetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) override {
+        return PutNative(prop::SourceReference_ChannelIDs, channelIDs,
+                         std::size_t{numberElements} * sizeof *channelIDs);
+    }
+    HRESULT GetChannelIDs(aafUInt32 numberElements, aafUInt32* channelIDs) override {
+        return ReadArray(*this, prop::SourceReference_ChannelIDs, channelIDs,
+                         std::size_t{numberElements} * sizeof *channelIDs);
+    }
+    HRESULT GetChannelIDsSize(aafUInt32* size) override {
+        return CountElements(*this, prop::SourceReference_ChannelIDs, sizeof(aafUInt32), size);
+    }
+    HRESULT SetMonoSourceSlotIDs(aafUInt32 numberElements, aafUInt32* monoSourceSlotIDs) override {
+        return PutNative(prop::SourceReference_MonoSourceSlotIDs, monoSourceSlotIDs,
+                         std::size_t{numberElements} * sizeof *monoSourceSlotIDs);
+    }
+    HRESULT GetMonoSourceSlotIDs(aafUInt32 numberElements, aafUInt32* monoSourceSlotIDs) override {
+        return ReadArray(*this, prop::SourceReference_MonoSourceSlotIDs, monoSourceSlotIDs,
+                         std::size_t{numberElements} * sizeof *monoSourceSlotIDs);
+    }
     HRESULT GetMonoSourceSlotIDsSize(aafUInt32* size) override;
 };
 
