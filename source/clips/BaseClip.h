@@ -155,6 +155,8 @@ public:
     NCFRESULT CommonSampleProviderCheck();
     NCFRESULT IsLPCMAudioByFormatID(ncfUInt32 formatID);
     NCFRESULT IsSupportedBitPerChannel(ncfUInt32 bits);
+    // 1 when the data files lead from the picture's code to a whole record.
+    NCFRESULT IsPictureInDataFiles(AAFInfo* aafInfo);
 
 protected:
     BaseClip(NCFSmartPtr<INCFString> fileName, NCFSmartPtr<INCFConsole> console,

@@ -3,8 +3,8 @@
 
 // The picture as the wrapper tells of it: identity, size, fields and colour.
 
-#include "source/clips/FourCharText.h"
 #include "source/clips/OtherClip.h"
+#include "source/plugin/FourCharText.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 

@@ -4,7 +4,6 @@
 // Whether the host may read this movie's picture or sound by itself.
 
 #include "source/clips/OtherClip.h"
-#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace {
@@ -75,11 +74,7 @@ NCFRESULT OtherClip::IsVideoSampleProviderMedia(AAFInfo* outAAFInfo) {
     NCF_RETURN(GetFirstVideoTrack(track));
     const ncfUInt32 descriptions = qtWrapper_->GetImageDescriptionCount(track);
     if (descriptions == 1) {
-        QuickTimeToAAFInfoRetriever* const retriever = QuickTimeToAAFInfoRetriever::GetInstance();
-        ncfUInt32 vcid = 0;
-        const bool described =
-            retriever && retriever->GetInfoFromImageDescription(this, outAAFInfo, &vcid) == NCF_OK;
-        return described ? 1 : 0;
+        return IsPictureInDataFiles(outAAFInfo);
     }
     if (descriptions > 1) {
         TellReason(ncfFunction, "More than one video ImageDescriptionHandle found",

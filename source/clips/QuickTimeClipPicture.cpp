@@ -7,9 +7,9 @@
 #include <string>
 
 #include "host_interfaces/util/NMAString.h"
-#include "source/clips/FourCharText.h"
 #include "source/clips/QuickTimeClip.h"
 #include "source/descriptor_data/QTAttributesXMLParser.h"
+#include "source/plugin/FourCharText.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 

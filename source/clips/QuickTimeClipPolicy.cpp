@@ -4,7 +4,6 @@
 // Whether the host may read this movie's picture or sound by itself.
 
 #include "source/clips/QuickTimeClip.h"
-#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "source/plugin/ResultChecks.h"
 
 NCFRESULT QuickTimeClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64* numAudioSamples) {
@@ -68,8 +67,5 @@ NCFRESULT QuickTimeClip::IsVideoSampleProviderMedia(AAFInfo* aafInfo) {
         TellReason(ncfFunction, "The movie contains alpha.");
         return 0;
     }
-    QuickTimeToAAFInfoRetriever* const retriever = QuickTimeToAAFInfoRetriever::GetInstance();
-    ncfUInt32 vcid = 0;
-    return retriever && retriever->GetInfoFromImageDescription(this, aafInfo, &vcid) == NCF_OK ? 1
-                                                                                               : 0;
+    return IsPictureInDataFiles(aafInfo);
 }

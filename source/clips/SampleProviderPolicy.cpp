@@ -9,7 +9,9 @@
 
 #include <sstream>
 
-#include "source/clips/FourCharText.h"
+#include "source/clips/ClipPicture.h"
+#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
+#include "source/plugin/FourCharText.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 
@@ -61,6 +63,15 @@ NCFRESULT BaseClip::IsSupportedBitPerChannel(ncfUInt32 bits) {
            << " was found but only bit rates of 16 and 24 are natively supported.";
     TellReason(ncfFunction, reason.str().c_str());
     return kSampleProvider;
+}
+
+NCFRESULT BaseClip::IsPictureInDataFiles(AAFInfo* aafInfo) {
+    QuickTimeToAAFInfoRetriever* const retriever = QuickTimeToAAFInfoRetriever::GetInstance();
+    const ClipPicture picture(*this);
+    ncfUInt32 vcid = 0;
+    return retriever && retriever->GetInfoFromImageDescription(&picture, aafInfo, &vcid) == NCF_OK
+               ? kNative
+               : kSampleProvider;
 }
 
 NCFRESULT BaseClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64*) {

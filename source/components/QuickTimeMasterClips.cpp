@@ -9,15 +9,9 @@
 #include "source/clips/LoadMedia.h"
 #include "source/components/HostServices.h"
 #include "source/components/MoviePattern.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQuickTimeMasterClips(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                     void** out) {
-    return CreateInstanceOf<QuickTimeMasterClips>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeMasterClips::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {

@@ -9,18 +9,12 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/parameters/ParametersXML.h"
 #include "source/clips/LoadMedia.h"
+#include "source/essence/MappingAttachment.h"
 #include "source/essence/ProviderLock.h"
-#include "source/parameters/QTParameters.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQuickTimeSampleMapping(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                       void** out) {
-    return CreateInstanceOf<QuickTimeSampleMapping>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeSampleMapping::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {
@@ -102,7 +96,7 @@ NCFRESULT QuickTimeSampleMapping::QueryParametersXML(void** ppvObj) {
     NCF_RETURN_TEXT("_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, IID_INCFParametersXML, ppvObj)",
                     ncfCreate(_pComponentFactory.inArg(), CompID_QTParameters, IID_INCFParametersXML, created));
     // Only the module's own parameters can be attached.
-    auto* const pParams = dynamic_cast<QTParameters*>(created.inArg());
+    auto* const pParams = dynamic_cast<MappingAttachment*>(created.inArg());
     if (!pParams) {
         return NCF_E_UNEXPECTED;
     }

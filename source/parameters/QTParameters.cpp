@@ -8,15 +8,10 @@
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/parameters/QTParameterNames.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQTParameters(INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out) {
-    return CreateInstanceOf<QTParameters>(host, outer, iid, out);
-}
 
 NCFRESULT QTParameters::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {

@@ -6,6 +6,7 @@
 #include "host_interfaces/parameters/ParameterSuite.h"
 #include "host_interfaces/parameters/ParametersReader.h"
 #include "host_interfaces/parameters/ParametersXML.h"
+#include "source/essence/MappingAttachment.h"
 #include "source/essence/QuickTimeSampleMapping.h"
 
 namespace NMA::Impl {
@@ -20,7 +21,8 @@ namespace NMA::Impl {
 //
 // Sources by concern: the object and the interface (.cpp), ...Documents for what
 // the suite is told, ...Events for what the reader tells.
-class QTParameters final : public CNCFComponent<INCFParametersXML, IParametersHandler> {
+class QTParameters final : public CNCFComponent<INCFParametersXML, IParametersHandler>,
+                           public MappingAttachment {
 public:
     explicit QTParameters(INCFUnknown* outer) : CNCFComponent(outer) {}
 
@@ -29,7 +31,7 @@ public:
 
     // Takes the parameters of the mapping's clip, and what its file says as
     // their defaults. Until then all XML work is refused.
-    NCFRESULT AttachToQTSampleProvider(QuickTimeSampleMapping& sampleProvider);
+    NCFRESULT AttachToQTSampleProvider(QuickTimeSampleMapping& sampleProvider) override;
 
     // --- INCFParametersXML -------------------------------------------------------
 

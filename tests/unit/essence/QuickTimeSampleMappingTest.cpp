@@ -4,6 +4,7 @@
 #include "host_interfaces/header_parser/QTParser.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/parameters/ParametersXML.h"
+#include "source/parameters/QTParameters.h"
 #include "tests/unit/aaf/support/StubbornString.h"
 #include "tests/unit/essence/support/MappingFixture.h"
 
@@ -18,8 +19,8 @@ TEST_F(SampleMapping, TakesFactoryLockAndConsoleFromTheHostInThisOrder) {
     FakeLock* const ours = lock;
     const auto create = [&](INCFUnknown* unknown) {
         out = nullptr;
-        return NMA::Impl::CreateQuickTimeSampleMapping(unknown, nullptr, NMA::IID_ISampleMapping,
-                                                       &out);
+        return CreateInstanceOf<NMA::Impl::QuickTimeSampleMapping>(unknown, nullptr,
+                                                                   NMA::IID_ISampleMapping, &out);
     };
     EXPECT_EQ(create(nullptr), NCF_E_POINTER);
     host->refuseQuery(IID_INCFConsole, NCF_E_HANDLE);
@@ -35,8 +36,8 @@ TEST_F(SampleMapping, TakesFactoryLockAndConsoleFromTheHostInThisOrder) {
 TEST_F(SampleMapping, HasALockOfItsOwn) {
     void* out = nullptr;
     FakeLock* const first = lock;
-    ASSERT_EQ(NMA::Impl::CreateQuickTimeSampleMapping(host->unknown(), nullptr,
-                                                      NMA::IID_ISampleMapping, &out),
+    ASSERT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeSampleMapping>(host->unknown(), nullptr,
+                                                                  NMA::IID_ISampleMapping, &out),
               NCF_OK);
     EXPECT_NE(lock, first);
     static_cast<NMA::ISampleMapping*>(out)->Release();
@@ -98,7 +99,7 @@ TEST_F(SampleMapping, GivesNewParametersOfItsClipForEachQuery) {
     AddVideo(1);
     Bind();
     host->maker(NMA::CompID_QTParameters, [this](const GUID& iid, void** out) {
-        return NMA::Impl::CreateQTParameters(host->unknown(), nullptr, iid, out);
+        return CreateInstanceOf<NMA::Impl::QTParameters>(host->unknown(), nullptr, iid, out);
     });
     INCFParametersXML* answers[2] = {};
     for (INCFParametersXML*& answer : answers) {
@@ -290,8 +291,8 @@ TEST_F(SampleMapping, FailedAudioQueryGivesTheCodeAndAReferenceToRelease) {
 TEST_F(SampleMapping, CreationThatAsksForAProviderGivesItsFailureWithAReference) {
     void* out = nullptr;
     FakeLock* const first = lock;
-    EXPECT_EQ(NMA::Impl::CreateQuickTimeSampleMapping(host->unknown(), nullptr,
-                                                      NMA::IID_IUncompressedAudioProvider, &out),
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeSampleMapping>(
+                  host->unknown(), nullptr, NMA::IID_IUncompressedAudioProvider, &out),
               NCF_E_INVALIDARG);
     ASSERT_NE(out, nullptr);
     static_cast<INCFUnknown*>(out)->Release();

@@ -136,9 +136,7 @@ public:
             return result;
         }
         if (askRetriever) {
-            ncfUInt32 id = 0;
-            return QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
-                       this, out, &id) == NCF_OK;
+            return IsPictureInDataFiles(out);
         }
         if (nativePicture == 1 || halfReadRecord) {
             *out = record;

@@ -8,7 +8,6 @@
 
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/CreationFunctions.h"
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/support/fakes/RecordingLogger.h"
 #include "tests/unit/essence/support/EssenceClip.h"
