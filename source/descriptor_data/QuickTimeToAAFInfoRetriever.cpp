@@ -4,7 +4,6 @@
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 
 #include <atomic>
-#include <cstring>
 #include <mutex>
 #include <sstream>
 #include <string>
@@ -174,8 +173,7 @@ NCFRESULT QuickTimeToAAFInfoRetriever::FillInfo(const Query& query, AAFInfo& aaf
     const char* failedCall = nullptr;
     const NCFRESULT result = ReadRecord(query, aafInfo, &failedCall);
     if (failedCall) {
-        if (result == NCF_E_NOTSUPPORTED &&
-            std::strcmp(failedCall, "GetEssenceContainerLabelFromVCID") == 0) {
+        if (result == NCF_E_NOTSUPPORTED && failedCall == kContainerLabelGetter) {
             ReportUnknownId(query);
         }
         DataRecord(kDataNotice, kGetInfo)

@@ -87,7 +87,7 @@ public:
 
 private:
     template <class Wanted>
-    void collect(const NMAString& name, Wanted wanted, std::vector<NMAXmlElement*>& out);
+    std::vector<NMAXmlElement*> select(const NMAString& name, Wanted wanted);
     template <class Wanted>
     void remove(const NMAString& name, Wanted wanted);
     static bool isNamed(NMAXmlElement& element, const NMAString& name);

@@ -47,6 +47,10 @@ NMAXmlElement* At(const std::vector<NMAXmlElement*>& found, ncfUInt32 index) {
     return index < found.size() ? found[index] : nullptr;
 }
 
+void Append(const std::vector<NMAXmlElement*>& found, std::vector<NMAXmlElement*>& out) {
+    out.insert(out.end(), found.begin(), found.end());
+}
+
 ncfUInt32 SizeOf(const std::vector<NMAXmlElement*>& found) {
     return static_cast<ncfUInt32>(found.size());
 }
@@ -60,21 +64,21 @@ bool NMAXmlElement::isNamed(NMAXmlElement& element, const NMAString& name) {
 }
 
 template <class Wanted>
-void NMAXmlElement::collect(const NMAString& name, Wanted wanted,
-                            std::vector<NMAXmlElement*>& out) {
+std::vector<NMAXmlElement*> NMAXmlElement::select(const NMAString& name, Wanted wanted) {
+    std::vector<NMAXmlElement*> selected;
     LoadChildren();
     for (NMAXmlNode* child : children_) {
         auto* const element = dynamic_cast<NMAXmlElement*>(child);
         if (element && isNamed(*element, name) && wanted(*element)) {
-            out.push_back(element);
+            selected.push_back(element);
         }
     }
+    return selected;
 }
 
 template <class Wanted>
 void NMAXmlElement::remove(const NMAString& name, Wanted wanted) {
-    std::vector<NMAXmlElement*> unwanted;
-    collect(name, wanted, unwanted);
+    std::vector<NMAXmlElement*> unwanted = select(name, wanted);
     if (unwanted.empty()) {
         return;
     }
@@ -89,9 +93,7 @@ void NMAXmlElement::remove(const NMAString& name, Wanted wanted) {
 }
 
 ncfUInt32 NMAXmlElement::CountChildren(const NMAString& name) {
-    std::vector<NMAXmlElement*> found;
-    collect(name, AnyElement, found);
-    return SizeOf(found);
+    return SizeOf(select(name, AnyElement));
 }
 
 NMAXmlElement* NMAXmlElement::FindChild(const NMAString& name, ncfUInt32 index) {
@@ -114,7 +116,7 @@ NMAXmlElement* NMAXmlElement::FindChild(const NMAString& name, ncfUInt32 index) 
 }
 
 void NMAXmlElement::CollectChildren(const NMAString& name, std::vector<NMAXmlElement*>& out) {
-    collect(name, AnyElement, out);
+    Append(select(name, AnyElement), out);
 }
 
 void NMAXmlElement::RemoveChildren(const NMAString& name) {
@@ -123,23 +125,19 @@ void NMAXmlElement::RemoveChildren(const NMAString& name) {
 
 ncfUInt32 NMAXmlElement::CountChildrenWithAttributes(const NMAString& name, const NMAXmlPair* pairs,
                                                      ncfSInt32 count) {
-    std::vector<NMAXmlElement*> found;
-    collect(name, ByAttributes(pairs, count), found);
-    return SizeOf(found);
+    return SizeOf(select(name, ByAttributes(pairs, count)));
 }
 
 NMAXmlElement* NMAXmlElement::FindChildWithAttributes(const NMAString& name,
                                                       const NMAXmlPair* pairs, ncfSInt32 count,
                                                       ncfUInt32 index) {
-    std::vector<NMAXmlElement*> found;
-    collect(name, ByAttributes(pairs, count), found);
-    return At(found, index);
+    return At(select(name, ByAttributes(pairs, count)), index);
 }
 
 void NMAXmlElement::CollectChildrenWithAttributes(const NMAString& name, const NMAXmlPair* pairs,
                                                   ncfSInt32 count,
                                                   std::vector<NMAXmlElement*>& out) {
-    collect(name, ByAttributes(pairs, count), out);
+    Append(select(name, ByAttributes(pairs, count)), out);
 }
 
 void NMAXmlElement::RemoveChildrenWithAttributes(const NMAString& name, const NMAXmlPair* pairs,
@@ -149,21 +147,17 @@ void NMAXmlElement::RemoveChildrenWithAttributes(const NMAString& name, const NM
 
 ncfUInt32 NMAXmlElement::CountChildrenWithChildren(const NMAString& name, const NMAXmlPair* pairs,
                                                    ncfSInt32 count) {
-    std::vector<NMAXmlElement*> found;
-    collect(name, ByChildren(pairs, count), found);
-    return SizeOf(found);
+    return SizeOf(select(name, ByChildren(pairs, count)));
 }
 
 NMAXmlElement* NMAXmlElement::FindChildWithChildren(const NMAString& name, const NMAXmlPair* pairs,
                                                     ncfSInt32 count, ncfUInt32 index) {
-    std::vector<NMAXmlElement*> found;
-    collect(name, ByChildren(pairs, count), found);
-    return At(found, index);
+    return At(select(name, ByChildren(pairs, count)), index);
 }
 
 void NMAXmlElement::CollectChildrenWithChildren(const NMAString& name, const NMAXmlPair* pairs,
                                                 ncfSInt32 count, std::vector<NMAXmlElement*>& out) {
-    collect(name, ByChildren(pairs, count), out);
+    Append(select(name, ByChildren(pairs, count)), out);
 }
 
 void NMAXmlElement::RemoveChildrenWithChildren(const NMAString& name, const NMAXmlPair* pairs,
@@ -196,9 +190,7 @@ bool NMAXmlElement::MatchesChildren(const NMAXmlPair* pairs, ncfSInt32 count,
         return true;
     }
     for (ncfSInt32 i = 0; i < count; ++i) {
-        std::vector<NMAXmlElement*> named;
-        collect(NameOf(pairs[i]), AnyElement, named);
-        for (NMAXmlElement* child : named) {
+        for (NMAXmlElement* child : select(NameOf(pairs[i]), AnyElement)) {
             NMAString text;
             child->GetText(text);
             if (AreEqual(text, pairs[i].value, caseSensitive)) {
