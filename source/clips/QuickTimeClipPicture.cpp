@@ -69,13 +69,13 @@ NCFRESULT QuickTimeClip::GetNivoResolution(ncfUInt32* vcID) const {
 NCFRESULT QuickTimeClip::GetEncodedWidthAndHeightImpl(ncfUInt32*, ncfUInt32*) {
     NCF_FUNCTION("QuickTimeClip::GetEncodedWidthAndHeightImpl");
     return AskFirstPicture(ncfFunction, [&](const FirstPicture& vdscr) -> NCFRESULT {
-        auto width = static_cast<ncfUInt16>(width_);
-        auto height = static_cast<ncfUInt16>(height_);
+        auto width = static_cast<ncfUInt16>(picture_.width);
+        auto height = static_cast<ncfUInt16>(picture_.height);
         NCF_RETURN_TEXT(
             "vdscr->GetEncodedWidthAndHeight((ncfUInt16*)&width_, (ncfUInt16*)&height_)",
             vdscr->GetEncodedWidthAndHeight(&width, &height));
-        width_ = (width_ & 0xFFFF0000u) | width;
-        height_ = (height_ & 0xFFFF0000u) | height;
+        picture_.width = (picture_.width & 0xFFFF0000u) | width;
+        picture_.height = (picture_.height & 0xFFFF0000u) | height;
         return NCF_OK;
     });
 }
@@ -85,10 +85,12 @@ NCFRESULT QuickTimeClip::GetImageAspectRatioImpl(ncfUInt32*, ncfUInt32*) {
     return AskFirstPicture(
         ncfFunction,
         [&](const FirstPicture& vdscr) -> NCFRESULT {
-            // clang-format off
-    NCF_RETURN(vdscr->GetImageAspectRatio(&imageAspectRatioNumerator_, &imageAspectRatioDenominator_));
-            // clang-format on
-            NCFASSERT(imageAspectRatioNumerator_ && imageAspectRatioDenominator_);
+            NCF_RETURN_TEXT(
+                "vdscr->GetImageAspectRatio(&imageAspectRatioNumerator_, "
+                "&imageAspectRatioDenominator_)",
+                vdscr->GetImageAspectRatio(&picture_.aspectNumerator, &picture_.aspectDenominator));
+            NCFASSERT_TEXT("imageAspectRatioNumerator_ && imageAspectRatioDenominator_",
+                           picture_.aspectNumerator && picture_.aspectDenominator);
             return NCF_OK;
         },
         "vti");
@@ -111,13 +113,14 @@ NCFRESULT QuickTimeClip::SetFieldLayoutDetails() {
             NCF_RETURN(vdscr->GetEncodedWidthAndHeight(&width, &height));
             // Replaced below by the values of a progressive picture: the size
             // alone decides nothing here.
-            ApplySizeBasedFieldDefault(width, height);
+            picture_.fields.ApplySize(width, height);
         } else if (r != NCF_OK) {
             console_->Write(
                 4, "SetFieldLayoutDetails failed, default to full progressive and merged \n");
             return r;
         }
-        ApplyFieldDetails(fieldCount != 1, topFieldFirst != 0, split != 0);
+        picture_.fields.Apply(fieldCount != 1, topFieldFirst != 0, split != 0, clipParams_,
+                              console_);
         return NCF_OK;
     });
 }
@@ -148,32 +151,32 @@ NCFRESULT QuickTimeClip::SetColorSpaceImpl() {
             const ncfUInt32 flagB = parserColor->ColorFlagB();
             const ncfUInt32 flagA = parserColor->ColorFlagA();
             if (flagA == 0 || flagB == 0) {
-                colorSpace_ = CS_RGB;
-                colorDetails_.hasVendorMetadata = true;
-                colorDetails_.transferCharacteristicUID = kMarkedTransferCharacteristic;
-                colorDetails_.refBlack = -1;
-                colorDetails_.refWhite = -1;
+                picture_.colorSpace = CS_RGB;
+                picture_.color.hasVendorMetadata = true;
+                picture_.color.transferCharacteristicUID = kMarkedTransferCharacteristic;
+                picture_.color.refBlack = -1;
+                picture_.color.refWhite = -1;
                 return NCF_OK;
             }
         }
         ncfUInt32 codes[3] = {kUnspecified, kUnspecified, kUnspecified};
         const NCFRESULT r = vdscr->GetVideoColorSpaceDetails(codes);
-        colorSpace_ = CS_RGB;
-        colorDetails_.colorPrimaries = codes[0];
-        colorDetails_.transferFunction = codes[1];
-        colorDetails_.matrix = codes[2];
-        colorDetails_.hasVendorMetadata = false;
-        colorDetails_.refBlack = -1;
-        colorDetails_.refWhite = -1;
+        picture_.colorSpace = CS_RGB;
+        picture_.color.colorPrimaries = codes[0];
+        picture_.color.transferFunction = codes[1];
+        picture_.color.matrix = codes[2];
+        picture_.color.hasVendorMetadata = false;
+        picture_.color.refBlack = -1;
+        picture_.color.refWhite = -1;
         if (r == NCF_E_PARAMETERNOTAVAILABLE) {
             console_->Write(4, "GetVideoColorSpaceDetails defaulting to RGB.\n");
         } else if (codes[0] == kPrimaries709 || codes[2] == kMatrix709 || codes[2] == kMatrix240M ||
                    codes[1] == kTransfer240M) {
             console_->Write(4, "GetVideoColorSpaceDetails detected 709.\n");
-            colorSpace_ = CS_YCbCr_709;
+            picture_.colorSpace = CS_YCbCr_709;
         } else if (codes[2] == kMatrix601) {
             console_->Write(4, "GetVideoColorSpaceDetails detected 601.\n");
-            colorSpace_ = CS_YCbCr_601;
+            picture_.colorSpace = CS_YCbCr_601;
         }
         return NCF_OK;
     });
@@ -209,13 +212,13 @@ NCFRESULT QuickTimeClip::ReadColorSpaceDescriptor() {
         NCF_RETURN(op_res);
         ColorSpaceDescriptor colorSpaceDescriptor;
         NCF_RETURN(xmlParser.GetColorSpaceDescriptor(&colorSpaceDescriptor));
-        colorDetails_.refBlack = colorSpaceDescriptor.minReference;
-        colorDetails_.refWhite = colorSpaceDescriptor.maxReference;
-        colorDetails_.name = colorSpaceDescriptor.name;
-        colorDetails_.transferCharacteristicName = colorSpaceDescriptor.transferCharacteristicName;
-        colorDetails_.transferCharacteristicUID = colorSpaceDescriptor.transferCharacteristicUID;
-        colorSpace_ = CS_RGB;
-        colorDetails_.hasVendorMetadata = true;
+        picture_.color.refBlack = colorSpaceDescriptor.minReference;
+        picture_.color.refWhite = colorSpaceDescriptor.maxReference;
+        picture_.color.name = colorSpaceDescriptor.name;
+        picture_.color.transferCharacteristicName = colorSpaceDescriptor.transferCharacteristicName;
+        picture_.color.transferCharacteristicUID = colorSpaceDescriptor.transferCharacteristicUID;
+        picture_.colorSpace = CS_RGB;
+        picture_.color.hasVendorMetadata = true;
         return NCF_OK;
     });
 }

@@ -23,7 +23,7 @@ NCFRESULT QuickTimeSampleMapping::InitializeInstance(INCFUnknown* host) {
         }
         ThrowIfFailed(ncfQuery(host, IID_INCFComponentFactory, _pComponentFactory));
         ThrowIfFailed(ncfCreate(_pComponentFactory.inArg(), CompID_LockComponent, IID_LockComponent,
-                                _providerLock));
+                                providerLock_));
         ThrowIfFailed(ncfQuery(host, IID_INCFConsole, _pConsole));
         return NCF_OK;
     });
@@ -61,10 +61,10 @@ NCFRESULT QuickTimeSampleMapping::InternalQueryInterface(const GUID& iid, void**
 
 NCFRESULT QuickTimeSampleMapping::PrepareImageProvider() {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::InternalQueryInterface");
-    if (_imageFormatsReady) {
+    if (imageFormatsReady_) {
         return NCF_OK;
     }
-    const ProviderLock lock(_providerLock);
+    const ProviderLock lock(providerLock_);
     if (!media_) {
         NCF_RETURN(LoadMedia(_filePath, _pConsole, _pComponentFactory, media_));
     }
@@ -124,12 +124,12 @@ NCFRESULT QuickTimeSampleMapping::SetMediaContainer(std::tr1::shared_ptr<BaseCli
 
 NCFRESULT QuickTimeSampleMapping::RefreshBasedOnUIParams() {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::RefreshBasedOnUIParams");
-    const ProviderLock lock(_providerLock);
+    const ProviderLock lock(providerLock_);
     if (!media_) {
         return NMA_E_NOTINITIALIZED;
     }
     // The fields matter even where no format came of the change.
-    if (_imageFormatsReady) {
+    if (imageFormatsReady_) {
         (void)AddDecompressorPixelFormats(FirstTrackOf(MediaTrack::kVideo), FirstAlphaTrackShown());
     } else {
         (void)AddSupportedImageFormatsBasedOnCodec();

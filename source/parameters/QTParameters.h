@@ -63,15 +63,15 @@ private:
                        const ClipParams& values);
     void WriteParameterDescription(IParameterSuite* suite);
 
-    NCFSmartPtr<INCFString> _setName;  // of the current set; a text of its own
-    NCFSmartPtr<QuickTimeSampleMapping> _sampleMapping;
-    NCFSmartPtr<INCFComponentFactory> _pComponentFactory;
-    ClipParams* _clipParams = nullptr;  // the clip's record, null before attaching
+    NCFSmartPtr<INCFString> setName_;  // of the current set; a text of its own
+    NCFSmartPtr<QuickTimeSampleMapping> sampleMapping_;
+    NCFSmartPtr<INCFComponentFactory> componentFactory_;
+    ClipParams* clipParams_ = nullptr;  // the clip's record, null before attaching
     // What "Default Settings" means for this clip.
-    ClipParams _defaultParams = {kProgressive, 16, 2, kFieldOrderUndetermined};
-    GUID _setId{};
-    bool _inComponent = false;  // inside this module's part of a document
-    bool _inSet = false;        // inside a set whose values are for taking
+    ClipParams defaultParams_ = {kProgressive, 16, 2, kFieldOrderUndetermined};
+    GUID setId_{};
+    bool inComponent_ = false;  // inside this module's part of a document
+    bool inSet_ = false;        // inside a set whose values are for taking
 };
 
 }  // namespace NMA::Impl

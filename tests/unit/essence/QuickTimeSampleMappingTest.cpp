@@ -171,7 +171,7 @@ TEST_F(SampleMapping, LooksForPictureFormatsAtTheFirstImageQueryUnderTheLock) {
     ASSERT_GE(journal.lines().size(), 2u);
     EXPECT_EQ(journal.lines().front(), "lock");
     EXPECT_EQ(journal.lines().back(), "unlock");
-    EXPECT_TRUE(mapping->_imageFormatsReady);
+    EXPECT_TRUE(mapping->imageFormatsReady_);
     EXPECT_EQ(property->path, "/movies/a.mov");
     journal.clear();
     EXPECT_EQ(QueryImages(), NCF_OK);
@@ -183,7 +183,7 @@ TEST_F(SampleMapping, LooksAgainAtEachImageQueryWhileNoFormatCouldBeAdded) {
     clip->setAlpha(true);
     Bind();
     EXPECT_EQ(QueryImages(), NCF_E_FAIL);
-    EXPECT_FALSE(mapping->_imageFormatsReady);
+    EXPECT_FALSE(mapping->imageFormatsReady_);
     EXPECT_EQ(QueryImages(), NCF_E_FAIL);
     EXPECT_EQ(journal.count("property.GetCodecStorageType"), 2);
 }
@@ -326,13 +326,13 @@ TEST_F(SampleMapping, TakesAClipThatCannotTellItsTracks) {
     AddAudio(2);
     clip->results["GetAudioTrackCount"] = NCF_E_FAIL;
     EXPECT_EQ(mapping->SetMediaContainer(clip), NCF_OK);
-    EXPECT_EQ(mapping->_mediaTracks.size(), 1u) << "what it told up to there";
+    EXPECT_EQ(mapping->mediaTracks_.size(), 1u) << "what it told up to there";
     EXPECT_EQ(log->count(Record("80000008", "media->GetAudioTrackCount(&audioTrackCount)",
                                 "InitializeMediaTracks")),
               1);
     clip->results["GetVideoTrackCount"] = NCF_E_HANDLE;
     EXPECT_EQ(mapping->SetMediaContainer(clip), NCF_OK);
-    EXPECT_EQ(mapping->_mediaTracks.size(), 1u);
+    EXPECT_EQ(mapping->mediaTracks_.size(), 1u);
 }
 
 // --- Setup and Cleanup -------------------------------------------------------------------------
@@ -449,7 +449,7 @@ TEST_F(SampleMapping, RefreshAddsFormatsThenLetsTheClipWorkOutItsFieldsUnderTheL
     EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_OK);
     EXPECT_EQ(Offered(0), (Lines{"2/1/8/1/1 <- 2vuy", "8/4/2/1/1 <- NVZ2"}))
         << "the new format comes behind, the old one stays";
-    EXPECT_EQ(mapping->_levelRemap, static_cast<ncfUInt32>(Expand_Levels));
+    EXPECT_EQ(mapping->levelRemap_, static_cast<ncfUInt32>(Expand_Levels));
     EXPECT_EQ(journal.count("property.CreateMovie"), 0) << "the codec is known";
     EXPECT_EQ(journal.lines().front(), "lock");
     ASSERT_GE(journal.lines().size(), 2u);
@@ -508,7 +508,7 @@ TEST_F(SampleMapping, RefreshBeforeTheFirstLookLooksAndIgnoresItsFailure) {
     EXPECT_EQ(journal.count("clip.SetFieldLayoutDetails"), 1);
     property->results.clear();
     EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_OK);
-    EXPECT_TRUE(mapping->_imageFormatsReady);
+    EXPECT_TRUE(mapping->imageFormatsReady_);
 }
 
 TEST_F(SampleMapping, RefreshGivesTheFailureOfTheFields) {

@@ -201,7 +201,7 @@ TEST_F(ParametersRoundTrip, AWriteReachesTheClipAndTheMapping) {
     EXPECT_EQ(visitor->SetUInt32(kComponent, 0, kParamSetDefault, kParamLevelRemapping, 1), NCF_OK);
     EXPECT_EQ(journal.count("lock"), 1) << "one refresh";
     EXPECT_EQ(record().levelRemap, 1u);
-    EXPECT_EQ(mapping->_levelRemap, 1u) << "the mapping followed";
+    EXPECT_EQ(mapping->levelRemap_, 1u) << "the mapping followed";
     EXPECT_EQ(record().fieldOrderInFile, 512u);
     EXPECT_EQ(record().fieldLayout, 2u);
     EXPECT_EQ(read(kParamLevelRemapping), 1u);

@@ -27,6 +27,7 @@ protected:
         EXPECT_EQ(Console(2, reason), 1) << reason;
         EXPECT_EQ(log->count(function + reason), 1) << reason;
     }
+    SampleProviderRule Rule() { return SampleProviderRule(TheConsole()); }
     NCFSmartPtr<INCFConsole> TheConsole() { return NCFSmartPtr<INCFConsole>(&host->console()); }
 
     AAFInfo info;
@@ -74,7 +75,7 @@ TEST_F(SampleProviderPolicy, ProvidesMoviesWithExternalMediaAtTheFirstCheck) {
 
 TEST_F(SampleProviderPolicy, GoesOnWhenSelfContainmentCannotBeAsked) {
     parser->results["IsMovieSelfContained"] = NCF_E_FAIL;
-    EXPECT_EQ(clip->CommonSampleProviderCheck(), 1);
+    EXPECT_EQ(Rule().CommonSampleProviderCheck(clip->IsSelfContained()), 1);
 }
 
 TEST_F(SampleProviderPolicy, ProvidesPicturesOfSeveralDescriptions) {
@@ -272,12 +273,12 @@ TEST_F(SampleProviderPolicy, HandsFailuresAboutSoundOn) {
 }
 
 TEST_F(SampleProviderPolicy, KnowsLinearSoundByOneCode) {
-    EXPECT_EQ(clip->IsLPCMAudioByFormatID(0x6C70636D), 1);
+    EXPECT_EQ(Rule().IsLPCMAudioByFormatID(0x6C70636D), 1);
     EXPECT_TRUE(host->console().lines().empty());
-    EXPECT_EQ(clip->IsLPCMAudioByFormatID(0x61616320), 0);
+    EXPECT_EQ(Rule().IsLPCMAudioByFormatID(0x61616320), 0);
     ExpectReason("BaseClip::IsLPCMAudioByFormatID",
                  "The FOURCC audio code of aac  is not natively supported.");
-    EXPECT_EQ(clip->IsLPCMAudioByFormatID(0x25736E25), 0);
+    EXPECT_EQ(Rule().IsLPCMAudioByFormatID(0x25736E25), 0);
     ExpectReason("BaseClip::IsLPCMAudioByFormatID",
                  "The FOURCC audio code of %sn% is not natively supported.");
 }

@@ -1,26 +1,16 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// Services of the host that a clip makes when something first needs them.
+#include "source/clips/MovieServices.h"
 
-#include <cstring>
-
-#include "source/clips/BaseClip.h"
 #include "source/plugin/ResultChecks.h"
-
-namespace {
-
-constexpr ncfUInt32 kCodecWindowsRaw = 0x57524157;  // 'WRAW'
-constexpr ncfUInt32 kCodecAppleRaw = 0x72617720;    // 'raw '
-
-}  // namespace
 
 // clang-format off
 // The statements below are logged as they were first written.
 
 // A wrapper whose movie failed to open is kept: the movie is not tried again,
 // and the wrapper answers every question with a failure.
-NCFRESULT BaseClip::GetQuickTimeInterface(NCFSmartPtr<QTWrapper::IQuickTimeWrapper>& out) {
+NCFRESULT MovieServices::GetQuickTimeInterface(NCFSmartPtr<QTWrapper::IQuickTimeWrapper>& out) {
     NCF_FUNCTION("BaseClip::GetQuickTimeInterface");
     if (qtWrapper_.isNull()) {
         NCF_RETURN_TEXT(
@@ -33,7 +23,7 @@ NCFRESULT BaseClip::GetQuickTimeInterface(NCFSmartPtr<QTWrapper::IQuickTimeWrapp
     return NCF_OK;
 }
 
-NCFRESULT BaseClip::GetQuickTimeVideoReader(NCFSmartPtr<QTWrapper::IQTVideoReader>& out) {
+NCFRESULT MovieServices::GetQuickTimeVideoReader(NCFSmartPtr<QTWrapper::IQTVideoReader>& out) {
     NCF_FUNCTION("BaseClip::GetQuickTimeVideoReader");
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper;
     NCF_RETURN(GetQuickTimeInterface(qtWrapper));
@@ -45,7 +35,7 @@ NCFRESULT BaseClip::GetQuickTimeVideoReader(NCFSmartPtr<QTWrapper::IQTVideoReade
     return NCF_OK;
 }
 
-NCFRESULT BaseClip::GetQuickTimeAudioReader(NCFSmartPtr<QTWrapper::IQTAudioReader>& out) {
+NCFRESULT MovieServices::GetQuickTimeAudioReader(NCFSmartPtr<QTWrapper::IQTAudioReader>& out) {
     NCF_FUNCTION("BaseClip::GetQuickTimeAudioReader");
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper;
     NCF_RETURN(GetQuickTimeInterface(qtWrapper));
@@ -57,7 +47,7 @@ NCFRESULT BaseClip::GetQuickTimeAudioReader(NCFSmartPtr<QTWrapper::IQTAudioReade
     return NCF_OK;
 }
 
-NCFRESULT BaseClip::GetQuickTimePropertyComponent(NCFSmartPtr<QuickTime::IQuickTimeProperty>& out) {
+NCFRESULT MovieServices::GetQuickTimePropertyComponent(NCFSmartPtr<QuickTime::IQuickTimeProperty>& out) {
     NCF_FUNCTION("BaseClip::GetQuickTimePropertyComponent");
     if (qtProperty_.isNull()) {
         NCF_RETURN_TEXT(
@@ -65,20 +55,6 @@ NCFRESULT BaseClip::GetQuickTimePropertyComponent(NCFSmartPtr<QuickTime::IQuickT
             ncfCreate(componentFactory_.inArg(), QuickTime::CompID_QuickTimeProperty, QuickTime::IID_IQuickTimeProperty, qtProperty_));
     }
     out = qtProperty_;
-    return NCF_OK;
-}
-
-bool BaseClip::IsNativeQuickTimeCodec(ncfUInt32 codecType) {
-    return codecType == kCodecWindowsRaw || codecType == kCodecAppleRaw;
-}
-
-NCFRESULT BaseClip::GetNativeQuickTimeCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) {
-    NCF_FUNCTION("BaseClip::GetNativeQuickTimeCodecName");
-    const char* codecTypeStr = codecType == kCodecWindowsRaw ? "Windows RAW Codec"
-                               : codecType == kCodecAppleRaw ? "Apple RAW Codec"
-                                                             : "Unknown Codec";
-    NCF_RETURN_TEXT("codecName->AssignUTF8(kNCFUTF8, (ncfUTF8*)codecTypeStr, (ncfUInt32)strlen(codecTypeStr))",
-                    codecName->AssignUTF8(kNCFUTF8, codecTypeStr, static_cast<ncfUInt32>(std::strlen(codecTypeStr))));
     return NCF_OK;
 }
 // clang-format on
