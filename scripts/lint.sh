@@ -14,6 +14,7 @@ rule() { # rule MESSAGE GREP-ARGS...
 rule 'the module knows the border alone' '#include "(reference_host|aaf_library)/' -- source host_interfaces public_include
 rule 'the host knows the border alone' '#include "(source|aaf_library)/' -- reference_host
 rule 'the AAF library knows the border alone' '#include "(source|reference_host)/' -- aaf_library
+scripts/check_rooms.sh || failed=1
 rule 'system headers belong in source/plugin/os/' \
   '#include <(windows|unistd|fcntl|dlfcn|pthread|sys/[a-z]+)\.h>' -- source public_include ':!source/plugin/os'
 rule 'throw typed codes, never literals or raw results' 'throw (0x|-?[0-9]|hr\b|\(?HRESULT)' -- source

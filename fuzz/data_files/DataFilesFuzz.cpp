@@ -15,13 +15,13 @@
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/framework/Host.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
-#include "source/clips/Rational.h"
 #include "source/descriptor_data/AAFInfoFields.h"
 #include "source/descriptor_data/FourCharDataContainerReader.h"
+#include "source/descriptor_data/GenericDocHandler.h"
 #include "source/descriptor_data/IGenericDocHandler.h"
 #include "source/descriptor_data/ParseAAFInfoXML.h"
-#include "source/descriptor_data/TextToNumber.h"
-#include "source/plugin/CreationFunctions.h"
+#include "source/plugin/Rational.h"
+#include "source/plugin/TextToNumber.h"
 #include "tests/support/TestFolder.h"
 
 namespace {
@@ -30,7 +30,8 @@ INCFComponentFactory* Factory() {
     static host::Host* const host = [] {
         auto* const made = new host::Host;
         host::RegisterXmlComponents(*made);
-        made->RegisterComponent(kCLSID_GenericDocHandler, NMA::Impl::CreateGenericDocHandler);
+        made->RegisterComponent(kCLSID_GenericDocHandler,
+                                CreateInstanceOf<NMA::Impl::GenericDocHandler>);
         NMAInitialize(&made->factory());
         return made;
     }();

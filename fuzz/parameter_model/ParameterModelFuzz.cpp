@@ -13,7 +13,7 @@
 #include "reference_host/framework/Host.h"
 #include "reference_host/framework/String.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
-#include "source/parameters/NMAParametersVisitor.h"
+#include "source/parameters/model/NMAParametersVisitor.h"
 
 namespace {
 

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "source/parameters/NMAParameterSuite.h"
+#include "source/parameters/model/NMAParameterSuite.h"
 
 namespace fuzz {
 

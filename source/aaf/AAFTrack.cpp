@@ -3,8 +3,6 @@
 
 #include "source/aaf/AAFTrack.h"
 
-#include <cwchar>
-
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "source/aaf/AAFGuard.h"
@@ -22,18 +20,10 @@ void ClearSlotName(const IAAFSmartPointer<IAAFMob>& mob, aafSlotID_t id) {
 
 }  // namespace
 
-std::wstring SlotLabel(const aafCharacter* format, ncfUInt32 number, std::size_t room) {
-    std::wstring label(room, L'\0');
-    if (std::swprintf(label.data(), room, format, static_cast<int>(number)) < 0) {
-        label.back() = L'\0';
-    }
-    return label.c_str();
-}
-
-NCFRESULT AddAAFTrack(const aafUID_t& dataDefUID, const aafCharacter* slotFormatLabel,
-                      ncfUInt32 slotsToAdd, ncfUInt32 startingSlot, ncfUInt32 totalExistingSlots,
-                      const aafRational_t& aaf_rate, aafLength_t movieLength,
-                      IAAFSmartPointer<IAAFDictionary> pDictionary,
+NCFRESULT AddAAFTrack(const aafUID_t& dataDefUID, const aafCharacter* /*slotFormatLabel*/,
+                      ncfUInt32 slotsToAdd, ncfUInt32 /*startingSlot*/,
+                      ncfUInt32 totalExistingSlots, const aafRational_t& aaf_rate,
+                      aafLength_t movieLength, IAAFSmartPointer<IAAFDictionary> pDictionary,
                       IAAFSmartPointer<IAAFMob> pMobMasterMob,
                       IAAFSmartPointer<IAAFMasterMob> pMasterMob,
                       IAAFSmartPointer<IAAFMob> pMobFileMob,
@@ -54,10 +44,6 @@ NCFRESULT AddAAFTrack(const aafUID_t& dataDefUID, const aafCharacter* slotFormat
             const aafSlotID_t id = totalExistingSlots + i;
             toFileMob.sourceSlotID = id;
             toSourceMob.sourceSlotID = id;
-            // Where a name would come from; slots of essence have none so far.
-            [[maybe_unused]] const std::wstring label =
-                SlotLabel(slotFormatLabel, startingSlot + i, 64);
-
             ThrowIfFailed(
                 pMasterMob->NewPhysSourceRef(aaf_rate, id, pDataDef, toFileMob, movieLength));
             ClearSlotName(pMobMasterMob, id);

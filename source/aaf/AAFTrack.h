@@ -2,8 +2,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <string>
-
 #include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMasterMobs.h"
 #include "host_interfaces/aaf/AAFMobs.h"
@@ -16,14 +14,11 @@ namespace NMA::Impl {
 // clip's own length.
 inline constexpr aafLength_t kNilReferenceLength = 12960000;
 
-// A slot's label from a format with one "%d"; shortened to what `room`
-// characters hold, terminator included.
-std::wstring SlotLabel(const aafCharacter* format, ncfUInt32 number, std::size_t room);
-
 // Adds `slotsToAdd` slots to all three mobs at once, with ids from
 // `totalExistingSlots` + 1 on: the master mob's slot refers to the file mob's
 // of the same id, that one to the source mob's, which refers to nothing.
-// Lengths are in edit units of `aaf_rate`, of sound too.
+// Lengths are in edit units of `aaf_rate`, of sound too. Slots have no name; the label's
+// format and number are where one would come from.
 NCFRESULT AddAAFTrack(const aafUID_t& dataDefUID, const aafCharacter* slotFormatLabel,
                       ncfUInt32 slotsToAdd, ncfUInt32 startingSlot, ncfUInt32 totalExistingSlots,
                       const aafRational_t& aaf_rate, aafLength_t movieLength,

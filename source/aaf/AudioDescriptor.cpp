@@ -7,6 +7,7 @@
 #include "host_interfaces/aaf/AAFSoundDescriptors.h"
 #include "source/aaf/BinColumns.h"
 #include "source/aaf/EditUnits.h"
+#include "source/aaf/RunSteps.h"
 #include "source/aaf/UniversalLabels.h"
 #include "source/aaf/VideoDescriptor.h"
 #include "source/clips/SampleProviderPolicy.h"
@@ -135,13 +136,6 @@ NCFRESULT SoundDescriptor::Append() {
 
 // clang-format on
 
-constexpr NCFRESULT (SoundDescriptor::*kSteps[])() = {
-    &SoundDescriptor::Create,
-    &SoundDescriptor::ReadTrack,
-    &SoundDescriptor::SetValues,
-    &SoundDescriptor::Append,
-};
-
 }  // namespace
 
 NCFRESULT AddAudioDescriptor(std::tr1::shared_ptr<BaseClip> media, ncfUInt32 trackNum,
@@ -157,13 +151,8 @@ NCFRESULT AddAudioDescriptor(std::tr1::shared_ptr<BaseClip> media, ncfUInt32 tra
 
     SoundDescriptor sound = {
         media, pConsole, pMobMasterMob, pDictionary, pMultiDescriptor, trackNum, numAudioChannels};
-    for (const auto step : kSteps) {
-        const NCFRESULT result = (sound.*step)();
-        if (result < 0) {
-            return result;
-        }
-    }
-    return NCF_OK;
+    return RunSteps(sound, &SoundDescriptor::Create, &SoundDescriptor::ReadTrack,
+                    &SoundDescriptor::SetValues, &SoundDescriptor::Append);
 }
 
 }  // namespace NMA::Impl

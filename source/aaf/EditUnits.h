@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
-#include "source/clips/Rational.h"
+#include "source/plugin/Rational.h"
 
 namespace NMA::Impl {
 

@@ -9,19 +9,17 @@
 
 #include "source/aaf/NewAAFFromMovie.h"
 
-#include "host_interfaces/aaf/AAFDescriptors.h"
-#include "host_interfaces/aaf/AAFDictionary.h"
-#include "host_interfaces/aaf/AAFMasterMobs.h"
-#include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/aaf/AAFDefs.h"
 #include "source/aaf/AAFGuard.h"
 #include "source/aaf/AAFRunTimeLibrary.h"
 #include "source/aaf/BinColumnMapping.h"
+#include "source/aaf/ClipDescription.h"
 #include "source/aaf/EditorSettingsReader.h"
 #include "source/aaf/Locators.h"
 #include "source/aaf/MobAttributes.h"
 #include "source/aaf/MobIds.h"
+#include "source/aaf/RunSteps.h"
 #include "source/aaf/Tracks.h"
 #include "source/plugin/ResultChecks.h"
 
@@ -30,24 +28,11 @@ namespace {
 
 NCF_FUNCTION("NMA::Impl::NewAAFFromMovie");
 
-// The file in the making and the views of its parts that the steps share. The
-// names are those that the log shows.
-struct Description {
-    std::tr1::shared_ptr<BaseClip> media;
-    NCFSmartPtr<INCFConsole> pConsole;
-    INCFComponentFactory* pComponentFactory;
+// The file in the making.
+struct Description : ClipDescription {
     NMAString theMoviePathW;
     NMAString clipName;
-
     IAAFSmartPointer<IAAFFile> pTheAAFFile;
-    IAAFSmartPointer<IAAFHeader> pHeader;
-    IAAFSmartPointer<IAAFDictionary> pDictionary;
-    IAAFSmartPointer<IAAFMob> pMobMasterMob;
-    IAAFSmartPointer<IAAFMasterMob> pMasterMob;
-    IAAFSmartPointer<IAAFMob> pMobFileMob;
-    IAAFSmartPointer<IAAFSourceMob> pFileMob;
-    IAAFSmartPointer<IAAFMob> pMobSourceMob;
-    IAAFSmartPointer<IAAFSourceMob> pSourceMob;
     bool showsAlpha = false;
     aafPosition_t absoluteStartTime = 0;
 
@@ -133,7 +118,6 @@ NCFRESULT Description::IdentifyMobs() {
 // All slots, and the file mob's descriptor with the movie's location.
 NCFRESULT Description::DescribeFileMob() {
     AAFDefs defs(pDictionary);
-    IAAFSmartPointer<IAAFMultipleDescriptor> pMultiDescriptor;
     IAAFSmartPointer<IAAFFileDescriptor> pFileDescriptor;
     NCF_RETURN(defs.cdMultipleDescriptor()->CreateInstance(IID_IAAFMultipleDescriptor, (IUnknown **)&pMultiDescriptor));
     NCF_RETURN(pMultiDescriptor->Initialize());
@@ -181,12 +165,6 @@ NCFRESULT Description::FinishMasterMob() {
 
 // clang-format on
 
-constexpr NCFRESULT (Description::*kSteps[])() = {
-    &Description::OpenFile,     &Description::MakeMobs,        &Description::SetRateAndLength,
-    &Description::IdentifyMobs, &Description::DescribeFileMob, &Description::DescribeSourceMob,
-    &Description::AddMobs,      &Description::FinishMasterMob,
-};
-
 }  // namespace
 
 NCFRESULT NewAAFFromMovie(std::tr1::shared_ptr<BaseClip> media, NCFSmartPtr<INCFConsole> pConsole,
@@ -203,11 +181,13 @@ NCFRESULT NewAAFFromMovie(std::tr1::shared_ptr<BaseClip> media, NCFSmartPtr<INCF
         description.pConsole = pConsole;
         description.pComponentFactory = pComponentFactory;
         description.theMoviePathW = NMAString(fileName.inArg(), kNCFWCHAR);
-        for (const auto step : kSteps) {
-            const NCFRESULT result = (description.*step)();
-            if (result < 0) {
-                return result;
-            }
+        const NCFRESULT result =
+            RunSteps(description, &Description::OpenFile, &Description::MakeMobs,
+                     &Description::SetRateAndLength, &Description::IdentifyMobs,
+                     &Description::DescribeFileMob, &Description::DescribeSourceMob,
+                     &Description::AddMobs, &Description::FinishMasterMob);
+        if (result != NCF_OK) {
+            return result;
         }
         *pOutAAFFile = description.pTheAAFFile;
         (*pOutAAFFile)->AddRef();

@@ -8,146 +8,100 @@
 
 #include "source/aaf/Timecode.h"
 
+#include <string>
+
 #include "host_interfaces/aaf/AAFComponents.h"
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFTimecodes.h"
 #include "source/aaf/AAFDefs.h"
 #include "source/aaf/AAFGuard.h"
-#include "source/aaf/AAFTrack.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
 #include "source/plugin/ResultChecks.h"
-
-// Calls the AAF library; anything but 0 is a failure, told to the process
-// logger with the library's own result and returned as `code`.
-#define TIMECODE_STEP(code, message, ...)                                           \
-    do {                                                                            \
-        if (const HRESULT hr = (__VA_ARGS__); hr != 0) {                            \
-            PluginLogger().Write(1, message ", AAFResult = 0x%x, %s(%d)",           \
-                                 static_cast<unsigned>(hr), kSourceName, __LINE__); \
-            return code;                                                            \
-        }                                                                           \
-    } while (false)
 
 namespace NMA::Impl {
 namespace {
 
 constexpr char kSourceName[] = "QuickTimeToAAF";
 
-// The slot in the making.
-struct TimecodeSequence {
-    AAFDefs defs;
-    IAAFSmartPointer<IAAFSequence> pSequence;
+// What is thrown when the AAF library answers anything but 0: `code`, after the library's
+// own result and the line of the call went to the process logger.
+void Require(HRESULT hr, NCFRESULT code, const char* message, int line = __builtin_LINE()) {
+    if (hr != 0) {
+        PluginLogger().Write(1, "%s, AAFResult = 0x%x, %s(%d)", message, static_cast<unsigned>(hr),
+                             kSourceName, line);
+        throw code;
+    }
+}
 
-    NCFRESULT Start();
-    NCFRESULT AppendTimecode(const aafTimecode_t& timecode, aafLength_t movieLength);
-    NCFRESULT MakeFiller(aafLength_t length, IAAFSmartPointer<IAAFComponent>& pFillerComponent);
-    NCFRESULT PrependFiller(aafLength_t length);
-    NCFRESULT AppendFiller(aafLength_t length);
+// The sequence of a slot in the making. Its steps throw their failures.
+class TimecodeSequence {
+public:
+    explicit TimecodeSequence(const IAAFSmartPointer<IAAFDictionary>& pDictionary)
+        : defs_(pDictionary) {
+        Require(defs_.cdSequence()->CreateInstance(IID_IAAFSequence, (IUnknown**)&sequence_),
+                NMA_E_AAF_CREATE, "Unable to create a new sequence");
+        Require(sequence_->Initialize(defs_.ddTimecode()), NCF_E_FAIL,
+                "Unable to initialize the sequence");
+    }
+
+    void AppendTimecode(aafTimecode_t timecode, aafLength_t length);
+    void PrependFiller(aafLength_t length) {
+        Require(sequence_->PrependComponent(MakeFiller(length)), NMA_E_AAF_ADD,
+                "Unable to add the component");
+    }
+    void AppendFiller(aafLength_t length) {
+        Require(sequence_->AppendComponent(MakeFiller(length)), NMA_E_AAF_ADD,
+                "Unable to add the component");
+    }
+    void AddToMob(IAAFMob& mob, const aafRational_t& rate, const aafCharacter* label,
+                  aafSlotID_t id, aafUInt32 physicalNumber);
+
+private:
+    IAAFSmartPointer<IAAFComponent> MakeFiller(aafLength_t length);
+
+    AAFDefs defs_;
+    IAAFSmartPointer<IAAFSequence> sequence_;
 };
 
-NCFRESULT TimecodeSequence::Start() {
-    TIMECODE_STEP(NMA_E_AAF_CREATE, "Unable to create a new sequence",
-                  defs.cdSequence()->CreateInstance(IID_IAAFSequence, (IUnknown**)&pSequence));
-    TIMECODE_STEP(NCF_E_FAIL, "Unable to initialize the sequence",
-                  pSequence->Initialize(defs.ddTimecode()));
-    return NCF_OK;
-}
-
-NCFRESULT TimecodeSequence::AppendTimecode(const aafTimecode_t& timecode, aafLength_t movieLength) {
+void TimecodeSequence::AppendTimecode(aafTimecode_t timecode, aafLength_t length) {
     IAAFSmartPointer<IAAFComponent> pComponent;
-    TIMECODE_STEP(NMA_E_AAF_CREATE, "Unable to create a new component",
-                  defs.cdTimecode()->CreateInstance(IID_IAAFComponent, (IUnknown**)&pComponent));
+    Require(defs_.cdTimecode()->CreateInstance(IID_IAAFComponent, (IUnknown**)&pComponent),
+            NMA_E_AAF_CREATE, "Unable to create a new component");
     IAAFSmartPointer<IAAFTimecode> pTimecode;
-    TIMECODE_STEP(NMA_E_AAF_QUERY, "Unable to query timecode",
-                  pComponent->QueryInterface(IID_IAAFTimecode, (void**)&pTimecode));
-    aafTimecode_t start = timecode;
-    TIMECODE_STEP(NCF_E_FAIL, "Unable to initialize the timecode component",
-                  pTimecode->Initialize(0, &start));
-    TIMECODE_STEP(NMA_E_AAF_ADD, "Unable to set the component type",
-                  pComponent->SetDataDef(defs.ddTimecode()));
-    TIMECODE_STEP(NMA_E_AAF_ADD, "Unable to set the timecode length",
-                  pComponent->SetLength(movieLength));
-    TIMECODE_STEP(NMA_E_AAF_ADD, "Unable to add the component",
-                  pSequence->AppendComponent(pComponent));
-    return NCF_OK;
+    Require(pComponent->QueryInterface(IID_IAAFTimecode, (void**)&pTimecode), NMA_E_AAF_QUERY,
+            "Unable to query timecode");
+    Require(pTimecode->Initialize(0, &timecode), NCF_E_FAIL,
+            "Unable to initialize the timecode component");
+    Require(pComponent->SetDataDef(defs_.ddTimecode()), NMA_E_AAF_ADD,
+            "Unable to set the component type");
+    Require(pComponent->SetLength(length), NMA_E_AAF_ADD, "Unable to set the timecode length");
+    Require(sequence_->AppendComponent(pComponent), NMA_E_AAF_ADD, "Unable to add the component");
 }
 
-NCFRESULT TimecodeSequence::MakeFiller(aafLength_t length,
-                                       IAAFSmartPointer<IAAFComponent>& pFillerComponent) {
+IAAFSmartPointer<IAAFComponent> TimecodeSequence::MakeFiller(aafLength_t length) {
     IAAFSmartPointer<IAAFFiller> pFiller;
-    TIMECODE_STEP(NMA_E_AAF_CREATE, "Unable to create a new filler",
-                  defs.cdFiller()->CreateInstance(IID_IAAFFiller, (IUnknown**)&pFiller));
-    TIMECODE_STEP(NCF_E_FAIL, "Unable to initialize the filler",
-                  pFiller->Initialize(defs.ddTimecode(), length));
-    TIMECODE_STEP(NMA_E_AAF_QUERY, "Unable to query component",
-                  pFiller->QueryInterface(IID_IAAFComponent, (void**)&pFillerComponent));
-    return NCF_OK;
+    Require(defs_.cdFiller()->CreateInstance(IID_IAAFFiller, (IUnknown**)&pFiller),
+            NMA_E_AAF_CREATE, "Unable to create a new filler");
+    Require(pFiller->Initialize(defs_.ddTimecode(), length), NCF_E_FAIL,
+            "Unable to initialize the filler");
+    IAAFSmartPointer<IAAFComponent> pComponent;
+    Require(pFiller->QueryInterface(IID_IAAFComponent, (void**)&pComponent), NMA_E_AAF_QUERY,
+            "Unable to query component");
+    return pComponent;
 }
 
-NCFRESULT TimecodeSequence::PrependFiller(aafLength_t length) {
-    IAAFSmartPointer<IAAFComponent> pFiller;
-    const NCFRESULT made = MakeFiller(length, pFiller);
-    if (made < 0) {
-        return made;
-    }
-    TIMECODE_STEP(NMA_E_AAF_ADD, "Unable to add the component",
-                  pSequence->PrependComponent(pFiller));
-    return NCF_OK;
-}
-
-NCFRESULT TimecodeSequence::AppendFiller(aafLength_t length) {
-    IAAFSmartPointer<IAAFComponent> pFiller;
-    const NCFRESULT made = MakeFiller(length, pFiller);
-    if (made < 0) {
-        return made;
-    }
-    TIMECODE_STEP(NMA_E_AAF_ADD, "Unable to add the component",
-                  pSequence->AppendComponent(pFiller));
-    return NCF_OK;
-}
-
-NCFRESULT AddTimecodeSlot(TimecodeSequence& sequence, const aafRational_t& movieEditRate,
-                          const aafCharacter* trackLabel, IAAFMob& mob, aafSlotID_t nSlotID,
-                          ncfUInt32 timecodeTrackNum) {
+void TimecodeSequence::AddToMob(IAAFMob& mob, const aafRational_t& rate, const aafCharacter* label,
+                                aafSlotID_t id, aafUInt32 physicalNumber) {
     IAAFSmartPointer<IAAFSegment> pSegment;
-    TIMECODE_STEP(NMA_E_AAF_QUERY, "Unable to query the sequence",
-                  sequence.pSequence->QueryInterface(IID_IAAFSegment, (void**)&pSegment));
+    Require(sequence_->QueryInterface(IID_IAAFSegment, (void**)&pSegment), NMA_E_AAF_QUERY,
+            "Unable to query the sequence");
     IAAFSmartPointer<IAAFTimelineMobSlot> pTimelineSlot;
-    TIMECODE_STEP(
-        NMA_E_AAF_ADD, "Unable to add the timecode",
-        mob.AppendNewTimelineSlot(movieEditRate, pSegment, nSlotID, trackLabel, 0, &pTimelineSlot));
+    Require(mob.AppendNewTimelineSlot(rate, pSegment, id, label, 0, &pTimelineSlot), NMA_E_AAF_ADD,
+            "Unable to add the timecode");
     IAAFSmartPointer<IAAFMobSlot> pSlot;
-    TIMECODE_STEP(NMA_E_AAF_ADD, "Unable to lookup slot", mob.LookupSlot(nSlotID, &pSlot));
-    // The host knows the main timecode by 1 and auxiliary ones from 3 on.
-    pSlot->SetPhysicalNum(timecodeTrackNum == 0 ? 1 : timecodeTrackNum + 2);
-    return NCF_OK;
-}
-
-NCFRESULT MakeTimecodeSlot(const IAAFSmartPointer<IAAFDictionary>& pDictionary,
-                           const aafRational_t& movieEditRate, const aafCharacter* trackLabel,
-                           const IAAFSmartPointer<IAAFMob>& pMobSourceMob, aafSlotID_t nSlotID,
-                           aafLength_t movieLength, aafLength_t maxLength, aafLength_t startTime,
-                           const aafTimecode_t& timecode, ncfUInt32 timecodeTrackNum) {
-    TimecodeSequence sequence{AAFDefs(pDictionary), {}};
-    NCFRESULT result = sequence.Start();
-    if (result == NCF_OK) {
-        result = sequence.AppendTimecode(timecode, movieLength);
-    }
-    if (result == NCF_OK && timecodeTrackNum > 0) {
-        result = sequence.PrependFiller(startTime);
-        if (result == NCF_OK) {
-            // Negative for a clip longer than a day: the library refuses it.
-            result = sequence.AppendFiller(static_cast<aafLength_t>(
-                static_cast<ncfUInt64>(maxLength) - static_cast<ncfUInt64>(movieLength) -
-                static_cast<ncfUInt64>(startTime)));
-        }
-    }
-    if (result != NCF_OK) {
-        return result;
-    }
-    return AddTimecodeSlot(sequence, movieEditRate, trackLabel, *pMobSourceMob.operator->(),
-                           nSlotID, timecodeTrackNum);
+    Require(mob.LookupSlot(id, &pSlot), NMA_E_AAF_ADD, "Unable to lookup slot");
+    pSlot->SetPhysicalNum(physicalNumber);
 }
 
 }  // namespace
@@ -157,9 +111,21 @@ NCFRESULT AddTimecode(IAAFSmartPointer<IAAFDictionary> pDictionary,
                       IAAFSmartPointer<IAAFMob> pMobSourceMob, aafSlotID_t nSlotID,
                       aafLength_t movieLength, aafLength_t maxLength, aafLength_t startTime,
                       const aafTimecode_t& timecode, ncfUInt32 timecodeTrackNum) {
+    const bool isMain = timecodeTrackNum == 0;
     try {
-        return MakeTimecodeSlot(pDictionary, movieEditRate, trackLabel, pMobSourceMob, nSlotID,
-                                movieLength, maxLength, startTime, timecode, timecodeTrackNum);
+        TimecodeSequence sequence(pDictionary);
+        sequence.AppendTimecode(timecode, movieLength);
+        if (!isMain) {
+            sequence.PrependFiller(startTime);
+            // Negative for a clip longer than a day: the library refuses it.
+            sequence.AppendFiller(static_cast<aafLength_t>(static_cast<ncfUInt64>(maxLength) -
+                                                           static_cast<ncfUInt64>(movieLength) -
+                                                           static_cast<ncfUInt64>(startTime)));
+        }
+        // The host knows the main timecode by 1 and auxiliary ones from 3 on.
+        sequence.AddToMob(*pMobSourceMob.operator->(), movieEditRate, trackLabel, nSlotID,
+                          isMain ? 1 : timecodeTrackNum + 2);
+        return NCF_OK;
     } catch (NCFRESULT result) {
         return result;
     } catch (...) {
@@ -179,15 +145,14 @@ NCFRESULT AddTimecodeAAFTrack(const aafTimecode_t& timecode, ncfUInt32 tcTrackNu
     return GuardAAF([&]() -> NCFRESULT {
         aafMobID_t sourceMobID{};
         ThrowIfFailed(pMobSourceMob->GetMobID(&sourceMobID));
-        const aafSlotID_t nSlotID = slotIndex + 1;
         const std::wstring label =
-            tcTrackNum == 0 ? L"TC1" : SlotLabel(L"AuxTC%d", tcTrackNum, 256);
-        const aafCharacter* const trackLabel = label.c_str();
-        const aafRational_t& movieEditRate = aafEditRate;
-        const ncfUInt32 timecodeTrackNum = tcTrackNum;
-        // clang-format off
-        NCF_RETURN(AddTimecode( pDictionary, movieEditRate, trackLabel, pMobSourceMob, nSlotID, movieLength, maxLength, startTime, timecode, timecodeTrackNum));
-        // clang-format on
+            tcTrackNum == 0 ? L"TC1"
+                            : L"AuxTC" + std::to_wstring(static_cast<ncfSInt32>(tcTrackNum));
+        NCF_RETURN_TEXT(
+            "AddTimecode( pDictionary, movieEditRate, trackLabel, pMobSourceMob, nSlotID, "
+            "movieLength, maxLength, startTime, timecode, timecodeTrackNum)",
+            AddTimecode(pDictionary, aafEditRate, label.c_str(), pMobSourceMob, slotIndex + 1,
+                        movieLength, maxLength, startTime, timecode, tcTrackNum));
         return NCF_OK;
     });
 }

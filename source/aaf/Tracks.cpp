@@ -10,6 +10,7 @@
 #include "source/aaf/AAFTrack.h"
 #include "source/aaf/AudioDescriptor.h"
 #include "source/aaf/EditUnits.h"
+#include "source/aaf/RunSteps.h"
 #include "source/aaf/Timecode.h"
 #include "source/aaf/VideoDescriptor.h"
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
@@ -24,20 +25,8 @@ NCF_FUNCTION("NMA::Impl::AddTracksToAAF");
 constexpr char fourCharXML[] = "FourCharMapper.xml";
 constexpr char AAFInfoXML[] = "AAFInfo.xml";
 
-// What the slots of one clip have in common, and how many there are by now.
-struct TrackMaker {
-    std::tr1::shared_ptr<BaseClip> media;
-    NCFSmartPtr<INCFConsole> pConsole;
-    IAAFSmartPointer<IAAFHeader> pHeader;
-    IAAFSmartPointer<IAAFDictionary> pDictionary;
-    IAAFSmartPointer<IAAFMob> pMobMasterMob;
-    IAAFSmartPointer<IAAFMasterMob> pMasterMob;
-    IAAFSmartPointer<IAAFMob> pMobFileMob;
-    IAAFSmartPointer<IAAFSourceMob> pFileMob;
-    IAAFSmartPointer<IAAFMob> pMobSourceMob;
-    IAAFSmartPointer<IAAFSourceMob> pSourceMob;
-    IAAFSmartPointer<IAAFMultipleDescriptor> pMultiDescriptor;
-    INCFComponentFactory* pComponentFactory;
+// The slots of one clip, and how many there are by now.
+struct TrackMaker : ClipDescription {
     aafPosition_t* absoluteStartTime;
 
     ncfUInt32 totalExistingSlots = 0;
@@ -163,13 +152,6 @@ NCFRESULT TrackMaker::AddSoundSlots() {
 
 // clang-format on
 
-constexpr NCFRESULT (TrackMaker::*kSteps[])() = {
-    &TrackMaker::ReadTiming,
-    &TrackMaker::AddTimecodeSlots,
-    &TrackMaker::AddPictureSlots,
-    &TrackMaker::AddSoundSlots,
-};
-
 }  // namespace
 
 NCFRESULT AddTracksToAAF(
@@ -194,26 +176,12 @@ NCFRESULT AddTracksToAAF(
     CHK_PTR(absoluteStartTime);
 
     *absoluteStartTime = 0;
-    TrackMaker maker = {media,
-                        pConsole,
-                        pHeader,
-                        pDictionary,
-                        pMobMasterMob,
-                        pMasterMob,
-                        pMobFileMob,
-                        pFileMob,
-                        pMobSourceMob,
-                        pSourceMob,
-                        pMultiDescriptor,
-                        pComponentFactory,
-                        absoluteStartTime};
-    for (const auto step : kSteps) {
-        const NCFRESULT result = (maker.*step)();
-        if (result < 0) {
-            return result;
-        }
-    }
-    return NCF_OK;
+    TrackMaker maker{
+        {media, pConsole, pComponentFactory, pHeader, pDictionary, pMobMasterMob, pMasterMob,
+         pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, pMultiDescriptor},
+        absoluteStartTime};
+    return RunSteps(maker, &TrackMaker::ReadTiming, &TrackMaker::AddTimecodeSlots,
+                    &TrackMaker::AddPictureSlots, &TrackMaker::AddSoundSlots);
 }
 
 }  // namespace NMA::Impl

@@ -2,15 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
-#include "host_interfaces/aaf/AAFDescriptors.h"
-#include "host_interfaces/aaf/AAFDictionary.h"
-#include "host_interfaces/aaf/AAFFile.h"
-#include "host_interfaces/aaf/AAFMasterMobs.h"
-#include "host_interfaces/aaf/AAFMobs.h"
-#include "source/aaf/AAFSmartPointer.h"
-#include "source/clips/BaseClip.h"
+#include "source/aaf/ClipDescription.h"
 
 namespace NMA::Impl {
 

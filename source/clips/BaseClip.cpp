@@ -3,17 +3,54 @@
 
 #include "source/clips/BaseClip.h"
 
+#include "host_interfaces/framework/HostSettings.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 
 BaseClip::BaseClip(NCFSmartPtr<INCFString> fileName, NCFSmartPtr<INCFConsole> console,
                    NCFSmartPtr<INCFComponentFactory> componentFactory)
-    : fileName_(fileName), console_(console), componentFactory_(componentFactory) {}
+    : fileName_(fileName),
+      console_(console),
+      componentFactory_(componentFactory),
+      services_(fileName, componentFactory),
+      rule_(console) {}
 
 BaseClip::~BaseClip() = default;
 
 NCFSmartPtr<INCFString> BaseClip::GetFileName() const {
     return fileName_;
+}
+
+// What both kinds of clip read from the picture while they load.
+NCFRESULT BaseClip::LoadClipBase() {
+    NCF_FUNCTION("BaseClip::LoadClipBase");
+    ncfUInt32 dummyW = 0;
+    ncfUInt32 dummyH = 0;
+    NCF_RETURN(GetEncodedWidthAndHeight(&dummyW, &dummyH));
+    NCF_RETURN(GetImageAspectRatio(&dummyW, &dummyH));
+    NCF_RETURN(SetColorSpaceImpl());
+    slog::Progress(ncfFunction) << "color_space: " << ColorSpaceToString(picture_.colorSpace);
+    NCF_RETURN(SetGeometryImpl());
+    NCF_RETURN(SetFieldLayoutDetails());
+
+    // A clip that can't tell its code is not loaded; the code itself is asked again.
+    ncfUInt32 fourCC = 0;
+    NCF_RETURN(GetDataFormat(&fourCC));
+
+    // A host without settings leaves the default in force.
+    NCFSmartPtr<NMA::IHostSettings> hostSettings;
+    // clang-format off
+    NCF_SKIP_TEXT(
+        "componentFactory_->CreateComponent(NMA::Impl::CompID_HostSettings, NULL, NMA::IID_IHostSettings, (void**)&hostSettings)",
+        ncfCreate(componentFactory_.inArg(), NMA::Impl::CompID_HostSettings, NMA::IID_IHostSettings, hostSettings));
+    if (hostSettings) {
+        NCF_SKIP_TEXT(
+            "hostSettings->GetHostSettingBoolean(NMA::NMAHostSetting_IgnoreAlpha, NMA::IHostSettings::kUserScope, &ignoreAlpha_)",
+            hostSettings->GetHostSettingBoolean(NMA::NMAHostSetting_IgnoreAlpha, NMA::IHostSettings::kUserScope, &picture_.ignoreAlpha));
+    }
+    // clang-format on
+    loaded_ = 1;
+    return NCF_OK;
 }
 
 // --- rate and length -----------------------------------------------------------
@@ -106,13 +143,14 @@ NCFRESULT BaseClip::GetEncodedWidthAndHeight(ncfUInt32* width, ncfUInt32* height
     NCF_FUNCTION("BaseClip::GetEncodedWidthAndHeight");
     CHK_PTR(width);
     CHK_PTR(height);
-    if (width_ == 0 || height_ == 0) {
+    if (picture_.width == 0 || picture_.height == 0) {
         NCF_RETURN(GetEncodedWidthAndHeightImpl(width, height));
-        slog::Progress(ncfFunction) << "width x height: " << width_ << " x " << height_;
+        slog::Progress(ncfFunction)
+            << "width x height: " << picture_.width << " x " << picture_.height;
     }
-    NCFASSERT(width_ && height_);
-    *width = width_;
-    *height = height_;
+    NCFASSERT_TEXT("width_ && height_", picture_.width && picture_.height);
+    *width = picture_.width;
+    *height = picture_.height;
     return NCF_OK;
 }
 
@@ -120,58 +158,58 @@ NCFRESULT BaseClip::GetImageAspectRatio(ncfUInt32* numerator, ncfUInt32* denomin
     NCF_FUNCTION("BaseClip::GetImageAspectRatio");
     CHK_INARG(numerator);
     CHK_INARG(denominator);
-    if (imageAspectRatioNumerator_ == 0 || imageAspectRatioDenominator_ == 0) {
+    if (picture_.aspectNumerator == 0 || picture_.aspectDenominator == 0) {
         NCF_RETURN(GetImageAspectRatioImpl(numerator, denominator));
-        slog::Progress(ncfFunction) << "image_aspect_ratio: " << imageAspectRatioNumerator_ << "/"
-                                    << imageAspectRatioDenominator_;
+        slog::Progress(ncfFunction) << "image_aspect_ratio: " << picture_.aspectNumerator << "/"
+                                    << picture_.aspectDenominator;
     }
     // A size of 0 is a broken movie; a ratio of 0 is only not known, and
     // nothing is logged for it.
-    if (imageAspectRatioNumerator_ == 0 || imageAspectRatioDenominator_ == 0) {
+    if (picture_.aspectNumerator == 0 || picture_.aspectDenominator == 0) {
         return NMA_E_NOTINITIALIZED;
     }
-    *numerator = imageAspectRatioNumerator_;
-    *denominator = imageAspectRatioDenominator_;
+    *numerator = picture_.aspectNumerator;
+    *denominator = picture_.aspectDenominator;
     return NCF_OK;
 }
 
 NCFRESULT BaseClip::GetColorSpace(ncfUInt32* colorSpace) const {
     NCF_FUNCTION("BaseClip::GetColorSpace");
     CHK_PTR(colorSpace);
-    if (colorSpace_ == kPropertyNotSet) {
+    if (picture_.colorSpace == kPropertyNotSet) {
         return NMA_E_NOTSET;
     }
-    *colorSpace = colorSpace_;
+    *colorSpace = picture_.colorSpace;
     return NCF_OK;
 }
 
 NCFRESULT BaseClip::GetTemporalFieldOrder(ncfUInt32* temporalFieldOrder) const {
     NCF_FUNCTION("BaseClip::GetTemporalFieldOrder");
     CHK_PTR(temporalFieldOrder);
-    if (temporalFieldOrder_ == kPropertyNotSet) {
+    if (picture_.fields.order == kPropertyNotSet) {
         return NMA_E_NOTSET;
     }
-    *temporalFieldOrder = temporalFieldOrder_;
+    *temporalFieldOrder = picture_.fields.order;
     return NCF_OK;
 }
 
 NCFRESULT BaseClip::GetFrameBufferLayout(ncfUInt32* frameBufferLayout) const {
     NCF_FUNCTION("BaseClip::GetFrameBufferLayout");
     CHK_PTR(frameBufferLayout);
-    if (frameBufferLayout_ == kPropertyNotSet) {
+    if (picture_.fields.layout == kPropertyNotSet) {
         return NMA_E_NOTSET;
     }
-    *frameBufferLayout = frameBufferLayout_;
+    *frameBufferLayout = picture_.fields.layout;
     return NCF_OK;
 }
 
 NCFRESULT BaseClip::GetBufferLineOrientation(ncfUInt32* bufferLineOrientation) const {
     NCF_FUNCTION("BaseClip::GetBufferLineOrientation");
     CHK_PTR(bufferLineOrientation);
-    if (bufferLineOrientation_ == kPropertyNotSet) {
+    if (picture_.fields.lineOrientation == kPropertyNotSet) {
         return NMA_E_NOTSET;
     }
-    *bufferLineOrientation = bufferLineOrientation_;
+    *bufferLineOrientation = picture_.fields.lineOrientation;
     return NCF_OK;
 }
 
@@ -179,7 +217,7 @@ NCFRESULT BaseClip::GetColorDetails(ColorDetails* colorDetails) const {
     if (!colorDetails) {
         return NCF_E_INVALIDARG;
     }
-    *colorDetails = colorDetails_;
+    *colorDetails = picture_.color;
     return NCF_OK;
 }
 
@@ -187,7 +225,7 @@ NCFRESULT BaseClip::GetGeometryDetails(GeometryDetails* geometryDetails) const {
     if (!geometryDetails) {
         return NCF_E_INVALIDARG;
     }
-    *geometryDetails = geometryDetails_;
+    *geometryDetails = picture_.geometry;
     return NCF_OK;
 }
 
@@ -203,4 +241,21 @@ NCFRESULT BaseClip::GetVideoTrackCount(ncfUInt32* trackCount) {
 
 NCFRESULT BaseClip::GetAudioTrackCount(ncfUInt32* trackCount) {
     return GetAudioTrackCountImpl(trackCount);
+}
+
+// --- the sample-provider rule for sound ------------------------------------------------
+
+NCFRESULT BaseClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64*) {
+    NCF_FUNCTION("BaseClip::IsAudioSampleProviderMedia");
+    if (rule_.CommonSampleProviderCheck(IsSelfContained()) == 0) {
+        return 0;
+    }
+    ncfBool isLPCM = 0;
+    NCF_RETURN(IsAudioLPCM(qtTrack, &isLPCM));
+    if (!isLPCM) {
+        return 0;
+    }
+    AudioTrackMetadata audioInfo;
+    NCF_RETURN(GetAudioTrackMetadata(qtTrack, &audioInfo));
+    return rule_.IsSupportedBitPerChannel(audioInfo.bitsPerChannel);
 }

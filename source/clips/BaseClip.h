@@ -5,11 +5,10 @@
 #include <tr1/memory>
 #include <vector>
 
-#include "host_interfaces/framework/ComponentFactory.h"
-#include "host_interfaces/framework/Console.h"
-#include "host_interfaces/quicktime/QuickTimeProperty.h"
-#include "host_interfaces/quicktime/QuickTimeWrapper.h"
 #include "source/clips/ClipRecords.h"
+#include "source/clips/MovieServices.h"
+#include "source/clips/PictureFacts.h"
+#include "source/clips/SampleProviderRule.h"
 
 struct AAFInfo;
 
@@ -129,7 +128,7 @@ public:
 
     bool IsLoaded() const { return loaded_ != 0; }
     // The picture has an alpha channel and the host wants to see it.
-    bool ShowsAlpha() const { return hasAlpha_ != 0 && ignoreAlpha_ == 0; }
+    bool ShowsAlpha() const { return picture_.hasAlpha != 0 && picture_.ignoreAlpha == 0; }
     ClipParams* GetClipParams() { return &clipParams_; }
 
     // Number of samples of an audio track to present with the video: cut to
@@ -138,23 +137,19 @@ public:
     NCFRESULT ObtainAudioTrackLength(ncfUInt32 qtTrack, ncfUInt64* adjustedNumSamples,
                                      bool* hasEnoughAudio = nullptr);
 
-    // Services that are made on first use and live as long as the clip. `out`
-    // gets a reference of its own.
-    NCFRESULT GetQuickTimeInterface(NCFSmartPtr<QTWrapper::IQuickTimeWrapper>& out);
-    NCFRESULT GetQuickTimeVideoReader(NCFSmartPtr<QTWrapper::IQTVideoReader>& out);
-    NCFRESULT GetQuickTimeAudioReader(NCFSmartPtr<QTWrapper::IQTAudioReader>& out);
-    NCFRESULT GetQuickTimePropertyComponent(NCFSmartPtr<QuickTime::IQuickTimeProperty>& out);
-
-    // Codecs whose names the module knows by itself.
-    static bool IsNativeQuickTimeCodec(ncfUInt32 codecType);
-    static NCFRESULT GetNativeQuickTimeCodecName(ncfUInt32 codecType,
-                                                 NCFSmartPtr<INCFString>& codecName);
-
-    // Steps of the sample-provider rule: 1 native, 0 not. A refusal tells its
-    // reason to the logger and the console.
-    NCFRESULT CommonSampleProviderCheck();
-    NCFRESULT IsLPCMAudioByFormatID(ncfUInt32 formatID);
-    NCFRESULT IsSupportedBitPerChannel(ncfUInt32 bits);
+    // See MovieServices.
+    NCFRESULT GetQuickTimeInterface(NCFSmartPtr<QTWrapper::IQuickTimeWrapper>& out) {
+        return services_.GetQuickTimeInterface(out);
+    }
+    NCFRESULT GetQuickTimeVideoReader(NCFSmartPtr<QTWrapper::IQTVideoReader>& out) {
+        return services_.GetQuickTimeVideoReader(out);
+    }
+    NCFRESULT GetQuickTimeAudioReader(NCFSmartPtr<QTWrapper::IQTAudioReader>& out) {
+        return services_.GetQuickTimeAudioReader(out);
+    }
+    NCFRESULT GetQuickTimePropertyComponent(NCFSmartPtr<QuickTime::IQuickTimeProperty>& out) {
+        return services_.GetQuickTimePropertyComponent(out);
+    }
 
 protected:
     BaseClip(NCFSmartPtr<INCFString> fileName, NCFSmartPtr<INCFConsole> console,
@@ -166,47 +161,14 @@ protected:
     NCFRESULT GetMovieLengthBase(ncfUInt64* movieLength) const;
     NCFRESULT GetEditRateBase(Rational* editRate) const;
 
-    // Rules of field order and layout that both kinds of clip apply to what
-    // their movie says, and the user's choice over that.
-    void ApplyFieldDetails(bool interlaced, bool topFieldFirst, bool split);
-    // Field order and layout by the size of the picture alone.
-    void ApplySizeBasedFieldDefault(ncfUInt32 width, ncfUInt32 height);
-
-    // The rectangles of a picture of this size and ratio, for movies that tell
-    // nothing of them.
-    void SetDefaultGeometry();
-
-    // Tells why a track or picture is not native, to the logger under the
-    // function's name and to the console, which may get a line of its own.
-    void TellReason(const char* function, const char* reason);
-    void TellReason(const char* function, const char* reason, const char* consoleLine);
-
     ncfSInt32 loaded_ = 0;
     NCFSmartPtr<INCFString> fileName_;
     NCFSmartPtr<INCFConsole> console_;
     NCFSmartPtr<INCFComponentFactory> componentFactory_;
-    ncfUInt32 temporalFieldOrder_ = kPropertyNotSet;
-    ncfUInt32 frameBufferLayout_ = kPropertyNotSet;
-    ncfUInt32 bufferLineOrientation_ = 1;
-    ncfUInt32 colorSpace_ = kPropertyNotSet;
-    ColorDetails colorDetails_;
-    GeometryDetails geometryDetails_;
-    ncfSInt32 hasAlpha_ = 0;
-    ncfSInt32 ignoreAlpha_ = 1;
-    ncfSInt32 isRotated_ = 0;  // the track's matrix turns the picture by 90 degrees
-    ncfUInt32 width_ = 0;      // encoded size
-    ncfUInt32 height_ = 0;
-    ncfUInt32 imageAspectRatioNumerator_ = 0;
-    ncfUInt32 imageAspectRatioDenominator_ = 0;
     Rational editRate_;
     ncfUInt64 length_ = 0;  // in video samples
-    char fourCC_[5] = {};   // data format as it lies in memory, terminated
+    PictureFacts picture_;
     ClipParams clipParams_;
-    NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper_;
-    NCFSmartPtr<QTWrapper::IQTAudioReader> qtAPIAudioReader_;
-    NCFSmartPtr<QTWrapper::IQTVideoReader> qtAPIVideoReader_;
-    NCFSmartPtr<QuickTime::IQuickTimeProperty> qtProperty_;
-
-private:
-    void ApplyUsersFields();
+    MovieServices services_;
+    SampleProviderRule rule_;
 };

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/framework/String.h"
-#include "source/clips/Rational.h"
+#include "source/plugin/BoundsBox.h"
 #include "source/plugin/NCFSmartPtr.h"
 #include "source/plugin/PixelEnums.h"
 
@@ -101,15 +101,6 @@ struct ColorDetails {
     NCFSmartPtr<INCFString> transferCharacteristicName;
     GUID transferCharacteristicUID{};
 };
-
-// A rectangle in the coordinates of the picture's raster; 0/0 is not given.
-struct BoundsBox {
-    Rational positionX;
-    Rational positionY;
-    Rational width;
-    Rational height;
-};
-static_assert(sizeof(BoundsBox) == 32, "saved as eight 32-bit numbers");
 
 struct GeometryDetails {
     BoundsBox framing;

@@ -4,7 +4,7 @@
 // The rectangles of a picture whose movie tells nothing of them, worked out of
 // size and ratio.
 
-#include "source/clips/BaseClip.h"
+#include "source/clips/PictureFacts.h"
 
 namespace {
 
@@ -40,11 +40,11 @@ bool IsHighDefinitionRaster(ncfUInt32 w, ncfUInt32 h) {
 
 // One rectangle for all four, centred on the origin. Standard rasters are
 // scaled to the width that their ratio has in square pixels.
-void BaseClip::SetDefaultGeometry() {
-    const ncfUInt32 w = isRotated_ ? height_ : width_;
-    const ncfUInt32 h = isRotated_ ? width_ : height_;
-    const auto an = static_cast<ncfSInt32>(imageAspectRatioNumerator_);
-    const auto ad = static_cast<ncfSInt32>(imageAspectRatioDenominator_);
+void PictureFacts::SetDefaultGeometry() {
+    const ncfUInt32 w = isRotated ? height : width;
+    const ncfUInt32 h = isRotated ? width : height;
+    const auto an = static_cast<ncfSInt32>(aspectNumerator);
+    const auto ad = static_cast<ncfSInt32>(aspectDenominator);
     ncfSInt32 scale = 1;
     ncfSInt32 div = 1;
     if (an == 4 && ad == 3) {
@@ -66,5 +66,5 @@ void BaseClip::SetDefaultGeometry() {
     box.height = Simplified(Wrapped(box.width.numerator, ad), Wrapped(box.width.denominator, an));
     box.positionY = Simplified(Negated(box.height.numerator), Wrapped(box.height.denominator, 2));
     box.positionX = Simplified(Negated(box.width.numerator), Wrapped(box.width.denominator, 2));
-    geometryDetails_ = GeometryDetails{box, box, box, box};
+    geometry = GeometryDetails{box, box, box, box};
 }

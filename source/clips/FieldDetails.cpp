@@ -4,7 +4,7 @@
 // Field order and layout of the picture: what the movie says, and the user's
 // choice laid over it.
 
-#include "source/clips/BaseClip.h"
+#include "source/clips/FieldDetails.h"
 
 namespace {
 
@@ -28,47 +28,47 @@ bool IsLayoutApart(ncfUInt32 layout) {
     return layout == kLayoutSplit || layout == 1024;
 }
 
-}  // namespace
-
-void BaseClip::ApplySizeBasedFieldDefault(ncfUInt32 width, ncfUInt32 height) {
-    frameBufferLayout_ = kLayoutMerged;
-    temporalFieldOrder_ = kProgressive;
-    if (width == 720 && height == 486) {
-        temporalFieldOrder_ = kBottomFieldFirst;
-    }
-}
-
-void BaseClip::ApplyFieldDetails(bool interlaced, bool topFieldFirst, bool split) {
-    frameBufferLayout_ = kLayoutMerged;
-    if (!interlaced) {
-        clipParams_.detectedFieldOrder = kProgressive;
-        temporalFieldOrder_ = kProgressive;
-        bufferLineOrientation_ = 1;
-        console_->Write(4,
-                        "QueryVideoDescBufferDetails says we are full progressive and merged \n");
-    } else {
-        temporalFieldOrder_ = topFieldFirst ? kTopFieldFirst : kBottomFieldFirst;
-        clipParams_.detectedFieldOrder = temporalFieldOrder_;
-        console_->Write(4, "%s", InterlacedText(topFieldFirst, split));
-    }
-    ApplyUsersFields();
-}
-
-void BaseClip::ApplyUsersFields() {
-    const ncfUInt32 userOrder = clipParams_.fieldOrderInFile;
-    const ncfUInt32 userLayout = clipParams_.fieldLayout;
+void ApplyUsersFields(const ClipParams& params, FieldDetails& fields) {
+    const ncfUInt32 userOrder = params.fieldOrderInFile;
+    const ncfUInt32 userLayout = params.fieldLayout;
     if (userOrder == kProgressive) {
-        temporalFieldOrder_ = kProgressive;
+        fields.order = kProgressive;
     } else if (userOrder == kTopFieldFirst || userOrder == kBottomFieldFirst) {
         if (userLayout == kUserMerged) {
-            frameBufferLayout_ = kLayoutMerged;
-        } else if (userLayout == kUserSplit || IsLayoutApart(frameBufferLayout_)) {
-            frameBufferLayout_ = kLayoutSplit;
+            fields.layout = kLayoutMerged;
+        } else if (userLayout == kUserSplit || IsLayoutApart(fields.layout)) {
+            fields.layout = kLayoutSplit;
         }
-        temporalFieldOrder_ = userOrder;
+        fields.order = userOrder;
     } else if (userLayout == kUserMerged) {
-        frameBufferLayout_ = kLayoutMerged;
+        fields.layout = kLayoutMerged;
     } else if (userLayout == kUserSplit) {
-        frameBufferLayout_ = kLayoutSplit;
+        fields.layout = kLayoutSplit;
     }
+}
+
+}  // namespace
+
+void FieldDetails::ApplySize(ncfUInt32 width, ncfUInt32 height) {
+    layout = kLayoutMerged;
+    order = kProgressive;
+    if (width == 720 && height == 486) {
+        order = kBottomFieldFirst;
+    }
+}
+
+void FieldDetails::Apply(bool interlaced, bool topFieldFirst, bool split, ClipParams& params,
+                         const NCFSmartPtr<INCFConsole>& console) {
+    layout = kLayoutMerged;
+    if (!interlaced) {
+        params.detectedFieldOrder = kProgressive;
+        order = kProgressive;
+        lineOrientation = 1;
+        console->Write(4, "QueryVideoDescBufferDetails says we are full progressive and merged \n");
+    } else {
+        order = topFieldFirst ? kTopFieldFirst : kBottomFieldFirst;
+        params.detectedFieldOrder = order;
+        console->Write(4, "%s", InterlacedText(topFieldFirst, split));
+    }
+    ApplyUsersFields(params, *this);
 }

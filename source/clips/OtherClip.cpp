@@ -6,6 +6,7 @@
 #include "source/clips/OtherClip.h"
 
 #include "host_interfaces/util/NMAString.h"
+#include "source/clips/NativeCodecs.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 
@@ -42,8 +43,8 @@ NCFRESULT OtherClip::LoadClipImpl() {
     NCF_RETURN(qtWrapper->MovieContainsAlpha(QTWrapper::kAlphaCheckForImport, &has_alpha_import));
     NCF_RETURN(qtWrapper->MovieContainsAlpha(QTWrapper::kAlphaCheckForQTNMA, &has_alpha_nma));
     // clang-format on
-    hasAlpha_ = has_alpha_import || has_alpha_nma;
-    if (hasAlpha_) {
+    picture_.hasAlpha = has_alpha_import || has_alpha_nma;
+    if (picture_.hasAlpha) {
         slog::Progress(ncfFunction) << "Movie has alpha!";
     }
     NCF_RETURN(BaseClip::LoadClipBase());

@@ -99,5 +99,7 @@ private:
     // Whether tracks of either kind disagree with the movie's length.
     NCFRESULT FindDurationIssues(const char* function, ncfBool& sound, ncfBool& picture);
 
+    // Null before loading made it.
+    const NCFSmartPtr<QTWrapper::IQuickTimeWrapper>& qtWrapper_ = services_.Wrapper();
     NCFSmartPtr<QTWrapper::IQTWSampleTable> sampleTable_;
 };

@@ -3,8 +3,8 @@
 
 // The picture as the wrapper tells of it: identity, size, fields and colour.
 
-#include "source/clips/FourCharText.h"
 #include "source/clips/OtherClip.h"
+#include "source/plugin/FourCharText.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 
@@ -82,9 +82,11 @@ NCFRESULT OtherClip::ReadMovieBox(const char* ncfFunction, bool& hasPicture) {
     NCF_RETURN(GetVideoTrackCountImpl(&trackCount));
     hasPicture = trackCount != 0;
     if (hasPicture) {
-        // clang-format off
-        NCF_RETURN(qtWrapper_->GetMovieBox(&width_, &height_, &imageAspectRatioNumerator_, &imageAspectRatioDenominator_));
-        // clang-format on
+        NCF_RETURN_TEXT(
+            "qtWrapper_->GetMovieBox(&width_, &height_, &imageAspectRatioNumerator_, "
+            "&imageAspectRatioDenominator_)",
+            qtWrapper_->GetMovieBox(&picture_.width, &picture_.height, &picture_.aspectNumerator,
+                                    &picture_.aspectDenominator));
     }
     return NCF_OK;
 }
@@ -98,10 +100,9 @@ NCFRESULT OtherClip::GetEncodedWidthAndHeightImpl(ncfUInt32*, ncfUInt32*) {
         return result;
     }
     if (hasPicture) {
-        // clang-format off
         NCF_RETURN_TEXT("qtWrapper_->QTWSetMovieBox(0, 0, (ncfSInt16)height_, (ncfSInt16)width_)",
-                        qtWrapper_->QTWSetMovieBox(0, 0, static_cast<ncfSInt16>(height_), static_cast<ncfSInt16>(width_)));
-        // clang-format on
+                        qtWrapper_->QTWSetMovieBox(0, 0, static_cast<ncfSInt16>(picture_.height),
+                                                   static_cast<ncfSInt16>(picture_.width)));
     }
     return NCF_OK;
 }
@@ -114,7 +115,7 @@ NCFRESULT OtherClip::GetImageAspectRatioImpl(ncfUInt32*, ncfUInt32*) {
 
 // The wrapper knows of no rectangles but the whole picture.
 NCFRESULT OtherClip::SetGeometryImpl() {
-    SetDefaultGeometry();
+    picture_.SetDefaultGeometry();
     return NCF_OK;
 }
 
@@ -132,16 +133,17 @@ NCFRESULT OtherClip::SetFieldLayoutDetails() {
         ncfUInt32 height = 0;
         NCF_RETURN_TEXT("qtWrapper_->GetMovieBox(&width, &height, NULL, NULL)",
                         qtWrapper_->GetMovieBox(&width, &height, nullptr, nullptr));
-        ApplySizeBasedFieldDefault(width, height);
+        picture_.fields.ApplySize(width, height);
         // What the size says is taken for the movie's own word.
-        flag = temporalFieldOrder_ == kProgressive ? 0 : 1;
+        flag = picture_.fields.order == kProgressive ? 0 : 1;
         bits = 0;
     } else if (result < 0) {
         console_->Write(
             4, "QueryVideoDescBufferDetails failed, default to full progressive and merged \n");
         return result;
     }
-    ApplyFieldDetails(flag != 0, (bits & kTopFieldFirstBit) != 0, (bits & kFieldsApartBit) != 0);
+    picture_.fields.Apply(flag != 0, (bits & kTopFieldFirstBit) != 0, (bits & kFieldsApartBit) != 0,
+                          clipParams_, console_);
     return NCF_OK;
 }
 
@@ -162,10 +164,10 @@ NCFRESULT OtherClip::GetNMAFrameLayout(ncfUInt32* frameLayout) const {
 NCFRESULT OtherClip::SetColorSpaceImpl() {
     NCF_FUNCTION("OtherClip::SetColorSpaceImpl");
     CHK_PTR(qtWrapper_);
-    colorSpace_ = CS_RGB;
-    colorDetails_.hasVendorMetadata = false;
-    colorDetails_.refBlack = -1;
-    colorDetails_.refWhite = -1;
+    picture_.colorSpace = CS_RGB;
+    picture_.color.hasVendorMetadata = false;
+    picture_.color.refBlack = -1;
+    picture_.color.refWhite = -1;
     ncfBool bYCbCr_709Found = 0;
     ncfBool bYCbCr_601Found = 0;
     NCF_RETURN_TEXT("qtWrapper_->GetCodecColorSpaceInfo( &bYCbCr_709Found, &bYCbCr_601Found)",
@@ -173,9 +175,9 @@ NCFRESULT OtherClip::SetColorSpaceImpl() {
     const ColorAnswer& answer =
         kColorAnswers[(bYCbCr_709Found ? 2 : 0) + (bYCbCr_601Found ? 1 : 0)];
     console_->Write(4, "%s", answer.line);
-    colorSpace_ = answer.colorSpace;
-    colorDetails_.colorPrimaries = answer.colorPrimaries;
-    colorDetails_.transferFunction = answer.transferFunction;
-    colorDetails_.matrix = answer.matrix;
+    picture_.colorSpace = answer.colorSpace;
+    picture_.color.colorPrimaries = answer.colorPrimaries;
+    picture_.color.transferFunction = answer.transferFunction;
+    picture_.color.matrix = answer.matrix;
     return NCF_OK;
 }

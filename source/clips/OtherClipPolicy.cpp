@@ -3,8 +3,8 @@
 
 // Whether the host may read this movie's picture or sound by itself.
 
+#include "source/clips/ClipPicture.h"
 #include "source/clips/OtherClip.h"
-#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace {
@@ -38,7 +38,7 @@ NCFRESULT OtherClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64* nu
         return asked;
     }
     if (sound) {
-        TellReason(ncfFunction, kDurationReason, kDurationLine);
+        rule_.TellReason(ncfFunction, kDurationReason, kDurationLine);
         return 0;
     }
     return 1;
@@ -48,13 +48,13 @@ NCFRESULT OtherClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64* nu
 NCFRESULT OtherClip::IsVideoSampleProviderMedia(AAFInfo* outAAFInfo) {
     NCF_FUNCTION("OtherClip::IsVideoSampleProviderMedia");
     CHK_INARG(outAAFInfo);
-    if (CommonSampleProviderCheck() == 0) {
+    if (rule_.CommonSampleProviderCheck(IsSelfContained()) == 0) {
         return 0;
     }
     CHK_PTR(qtWrapper_);
     if (qtWrapper_->MovieHasMultipleVideoTracks(0, 0)) {
-        TellReason(ncfFunction, "The movie contains more than one video track.",
-                   "The movie contains more than 1 video track.\n");
+        rule_.TellReason(ncfFunction, "The movie contains more than one video track.",
+                         "The movie contains more than 1 video track.\n");
         return 0;
     }
     ncfBool sound = 0;
@@ -64,29 +64,25 @@ NCFRESULT OtherClip::IsVideoSampleProviderMedia(AAFInfo* outAAFInfo) {
         return asked;
     }
     if (picture) {
-        TellReason(ncfFunction, kDurationReason, kDurationLine);
+        rule_.TellReason(ncfFunction, kDurationReason, kDurationLine);
         return 0;
     }
     if (ShowsAlpha()) {
-        TellReason(ncfFunction, "The movie contains alpha.", "The movie contains alpha.\n");
+        rule_.TellReason(ncfFunction, "The movie contains alpha.", "The movie contains alpha.\n");
         return 0;
     }
     ncfUInt32 track = 0;
     NCF_RETURN(GetFirstVideoTrack(track));
     const ncfUInt32 descriptions = qtWrapper_->GetImageDescriptionCount(track);
     if (descriptions == 1) {
-        QuickTimeToAAFInfoRetriever* const retriever = QuickTimeToAAFInfoRetriever::GetInstance();
-        ncfUInt32 vcid = 0;
-        const bool described =
-            retriever && retriever->GetInfoFromImageDescription(this, outAAFInfo, &vcid) == NCF_OK;
-        return described ? 1 : 0;
+        return rule_.IsInDataFiles(ClipPicture(*this), outAAFInfo);
     }
     if (descriptions > 1) {
-        TellReason(ncfFunction, "More than one video ImageDescriptionHandle found",
-                   "More than one video ImageDescriptionHandle found.\n");
+        rule_.TellReason(ncfFunction, "More than one video ImageDescriptionHandle found",
+                         "More than one video ImageDescriptionHandle found.\n");
     } else {
-        TellReason(ncfFunction, "Video is missing a ImageDescriptionHandle.",
-                   "Video is missing a ImageDescriptionHandle.\n");
+        rule_.TellReason(ncfFunction, "Video is missing a ImageDescriptionHandle.",
+                         "Video is missing a ImageDescriptionHandle.\n");
     }
     return 0;
 }

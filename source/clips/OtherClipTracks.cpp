@@ -150,6 +150,6 @@ NCFRESULT OtherClip::IsAudioLPCM(ncfUInt32 qtTrack, ncfBool* isLPCM) {
     CHK_PTR(isLPCM);
     AudioTrackMetadata audioInfo;
     NCF_RETURN(GetAudioTrackMetadata(qtTrack, &audioInfo));
-    *isLPCM = IsLPCMAudioByFormatID(audioInfo.formatID);
+    *isLPCM = rule_.IsLPCMAudioByFormatID(audioInfo.formatID);
     return NCF_OK;
 }

@@ -5,6 +5,7 @@
 
 #include "source/clips/QuickTimeClip.h"
 
+#include "source/clips/NativeCodecs.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
 
@@ -62,12 +63,12 @@ NCFRESULT QuickTimeClip::LoadClipImpl() {
     CHK_PTR(vti.inArg());
     NCFSmartPtr<IVideoSampleDescription> vdscr;
     NCF_RETURN(vti->GetVideoSampleDescription(0, vdscr.outArg()));
-    NCF_RETURN(vdscr->HasAlpha(&hasAlpha_));
+    NCF_RETURN_TEXT("vdscr->HasAlpha(&hasAlpha_)", vdscr->HasAlpha(&picture_.hasAlpha));
     const NCFRESULT confirmed = ConfirmNivoAlpha(vdscr.inArg());
     if (confirmed < 0) {
         return confirmed;
     }
-    if (hasAlpha_) {
+    if (picture_.hasAlpha) {
         slog::Progress(ncfFunction) << "Movie has alpha!";
     }
     FindRotation(vti.inArg());
@@ -93,7 +94,7 @@ NCFRESULT QuickTimeClip::ConfirmNivoAlpha(IVideoSampleDescription* vdscr) {
         NCF_RETURN(vdscr->GetNivoAlphaCoding(i, &alphaCoding));
     }
     if (alphaCoding == 0) {
-        hasAlpha_ = 0;
+        picture_.hasAlpha = 0;
     }
     return NCF_OK;
 }
@@ -102,7 +103,7 @@ void QuickTimeClip::FindRotation(IVideoTrackInfo* vti) {
     float matrix[9] = {};
     vti->GetTrackMatrix(matrix);
     if (RoundsTo(matrix[0], 0) && RoundsTo(matrix[1], 1)) {
-        isRotated_ = 1;
+        picture_.isRotated = 1;
     }
 }
 

@@ -6,6 +6,7 @@
 
 #include "host_interfaces/header_parser/QTParser.h"
 #include "source/clips/BaseClip.h"
+#include "source/plugin/ResultChecks.h"
 
 // A movie that is described by its headers: the file's bytes are fed to the
 // header parser until it is content, and everything else is asked of the
@@ -106,11 +107,27 @@ private:
     NCFRESULT GetOnlyAudioDescription(const char* function, ncfUInt32 qtTrack,
                                       NCFSmartPtr<IAudioSampleDescription>& adscr);
 
-    // The first description of the first video track, for `function`; the text
-    // is what is logged when there is no such track.
-    NCFRESULT GetFirstVideoDescription(const char* function,
-                                       NCFSmartPtr<IVideoSampleDescription>& vdscr,
-                                       const char* checkedText = "vti.inArg()") const;
+    // Asks the first description of the first video track, for the function that logs; the
+    // text is what is logged when there is no such track.
+    using FirstPicture = NCFSmartPtr<IVideoSampleDescription>;
+    template <class Question>
+    NCFRESULT AskFirstPicture(const char* ncfFunction, Question question,
+                              const char* checkedText = "vti.inArg()") const {
+        NCFSmartPtr<IVideoTrackInfo> vti = GetFirstVideoTrackInfo();
+        CHK_PTR_TEXT(checkedText, vti.inArg());
+        FirstPicture vdscr;
+        NCF_RETURN(vti->GetVideoSampleDescription(0, vdscr.outArg()));
+        return question(vdscr);
+    }
+    // Asks the sample table of a track for `out`, whose name is logged when it is null.
+    template <class Question>
+    NCFRESULT AskSampleTable(const char* ncfFunction, ncfUInt32 qtTrack, const void* out,
+                             const char* name, Question question) {
+        CHK_PTR_TEXT(name, out);
+        NCFSmartPtr<IQTSampleTable> sampleTable;
+        NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
+        return question(sampleTable);
+    }
 
     NCFRESULT SetAverageFrameRate(Rational& rate);
     NCFRESULT SetAVMovieLength();

@@ -19,7 +19,7 @@ constexpr char kBoundsTag[] = "<Bounds>";
 
 NCFRESULT QuickTimeClip::SetGeometryImpl() {
     if (SetGeometryImplFromSpecificMedia() != NCF_OK) {
-        SetDefaultGeometry();
+        picture_.SetDefaultGeometry();
     }
     return NCF_OK;
 }
@@ -58,10 +58,10 @@ NCFRESULT QuickTimeClip::ReadBounds() {
         QTBoxKind kind;
         BoundsBox* box;
     } const boxes[] = {
-        {kBoxFraming, &geometryDetails_.framing},
-        {kBoxEssence, &geometryDetails_.essence},
-        {kBoxSource, &geometryDetails_.source},
-        {kBoxValid, &geometryDetails_.valid},
+        {kBoxFraming, &picture_.geometry.framing},
+        {kBoxEssence, &picture_.geometry.essence},
+        {kBoxSource, &picture_.geometry.source},
+        {kBoxValid, &picture_.geometry.valid},
     };
     for (const auto& entry : boxes) {
         const NCFRESULT result = xmlParser.GetBox(entry.kind, entry.box);

@@ -3,8 +3,8 @@
 
 // Whether the host may read this movie's picture or sound by itself.
 
+#include "source/clips/ClipPicture.h"
 #include "source/clips/QuickTimeClip.h"
-#include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "source/plugin/ResultChecks.h"
 
 NCFRESULT QuickTimeClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64* numAudioSamples) {
@@ -22,13 +22,13 @@ NCFRESULT QuickTimeClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64
     NCF_RETURN(ati->IsTrackLinear(&linear, &areMediaAndTrackTimesProportional, NULL, NULL));
     // clang-format on
     if (!areMediaAndTrackTimesProportional) {
-        TellReason(ncfFunction, "The audio track contains non-trivial edit list(s).");
+        rule_.TellReason(ncfFunction, "The audio track contains non-trivial edit list(s).");
         return 0;
     }
     const NCFRESULT varying = ati->HasConstantSampleRate(nullptr);
     NCF_RETURN_TEXT("ati->HasConstantSampleRate(NULL)", varying);
     if (varying == 1) {
-        TellReason(ncfFunction, "The audio track contains variable sample size.");
+        rule_.TellReason(ncfFunction, "The audio track contains variable sample size.");
         return 0;
     }
     ncfUInt64 trackNumSamples = 0;
@@ -36,7 +36,8 @@ NCFRESULT QuickTimeClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64
     NCF_RETURN(CalculateAudioTrackLengthInSamples(qtTrack, &trackNumSamples));
     NCF_RETURN(CalculateMediaOnTrackLengthInSamples(qtTrack, &mediaNumSamples));
     if (trackNumSamples != mediaNumSamples) {
-        TellReason(ncfFunction, "The audio track length doesn't match corresponding media length.");
+        rule_.TellReason(ncfFunction,
+                         "The audio track length doesn't match corresponding media length.");
         return 0;
     }
     return 1;
@@ -46,7 +47,7 @@ NCFRESULT QuickTimeClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64
 // code leads to a full record there.
 NCFRESULT QuickTimeClip::IsVideoSampleProviderMedia(AAFInfo* aafInfo) {
     NCF_FUNCTION("QuickTimeClip::IsVideoSampleProviderMedia");
-    if (CommonSampleProviderCheck() == 0) {
+    if (rule_.CommonSampleProviderCheck(IsSelfContained()) == 0) {
         return 0;
     }
     NCFSmartPtr<IVideoTrackInfo> vti = GetFirstVideoTrackInfo();
@@ -54,22 +55,20 @@ NCFRESULT QuickTimeClip::IsVideoSampleProviderMedia(AAFInfo* aafInfo) {
     ncfUInt32 descCount = 1;
     NCF_RETURN(vti->GetSampleDescriptionCount(&descCount));
     if (descCount > 1) {
-        TellReason(ncfFunction,
-                   "The movie contains video track with more than one video image description.");
+        rule_.TellReason(
+            ncfFunction,
+            "The movie contains video track with more than one video image description.");
         return 0;
     }
     ncfUInt32 trackCount = 1;
     NCF_RETURN(qtParser_->GetVideoTrackCount(&trackCount));
     if (trackCount > 1) {
-        TellReason(ncfFunction, "The movie contains more than 1 video track.");
+        rule_.TellReason(ncfFunction, "The movie contains more than 1 video track.");
         return 0;
     }
     if (ShowsAlpha()) {
-        TellReason(ncfFunction, "The movie contains alpha.");
+        rule_.TellReason(ncfFunction, "The movie contains alpha.");
         return 0;
     }
-    QuickTimeToAAFInfoRetriever* const retriever = QuickTimeToAAFInfoRetriever::GetInstance();
-    ncfUInt32 vcid = 0;
-    return retriever && retriever->GetInfoFromImageDescription(this, aafInfo, &vcid) == NCF_OK ? 1
-                                                                                               : 0;
+    return rule_.IsInDataFiles(ClipPicture(*this), aafInfo);
 }

@@ -20,88 +20,68 @@ NCFRESULT QuickTimeClip::GetSampleTable(ncfUInt32 qtTrack, IQTSampleTable** samp
 }
 
 NCFRESULT QuickTimeClip::GetNumSamples(ncfUInt32 qtTrack, ncfUInt64* numSamples) {
-    NCF_FUNCTION("QuickTimeClip::GetNumSamples");
-    CHK_PTR(numSamples);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetNumSamples(numSamples);
+    return AskSampleTable("QuickTimeClip::GetNumSamples", qtTrack, numSamples, "numSamples",
+                          [&](auto& table) { return table->GetNumSamples(numSamples); });
 }
 
 NCFRESULT QuickTimeClip::GetDataOffset(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
                                        ncfUInt64* samplePosition) {
-    NCF_FUNCTION("QuickTimeClip::GetDataOffset");
-    CHK_PTR(samplePosition);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetDataOffset(sampleNum, samplePosition);
+    return AskSampleTable(
+        "QuickTimeClip::GetDataOffset", qtTrack, samplePosition, "samplePosition",
+        [&](auto& table) { return table->GetDataOffset(sampleNum, samplePosition); });
 }
 
 NCFRESULT QuickTimeClip::GetSampleFlags(ncfUInt32 qtTrack, ncfUInt64 sampleNum, ncfUInt32* flags) {
-    NCF_FUNCTION("QuickTimeClip::GetSampleFlags");
-    CHK_PTR(flags);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetSampleFlags(sampleNum, flags);
+    return AskSampleTable("QuickTimeClip::GetSampleFlags", qtTrack, flags, "flags",
+                          [&](auto& table) { return table->GetSampleFlags(sampleNum, flags); });
 }
 
 NCFRESULT QuickTimeClip::GetNextDiscontiguousDataAttributeChange(ncfUInt32 qtTrack,
                                                                  ncfUInt64 sampleNum,
                                                                  ncfUInt64* lastSample) {
-    NCF_FUNCTION("QuickTimeClip::GetNextDiscontiguousDataAttributeChange");
-    CHK_PTR(lastSample);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetNextDiscontiguousDataAttributeChange(sampleNum, lastSample);
+    return AskSampleTable("QuickTimeClip::GetNextDiscontiguousDataAttributeChange", qtTrack,
+                          lastSample, "lastSample", [&](auto& table) {
+                              return table->GetNextDiscontiguousDataAttributeChange(sampleNum,
+                                                                                    lastSample);
+                          });
 }
 
 NCFRESULT QuickTimeClip::GetDataSizePerSample(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
                                               ncfUInt32* dataSizeInBytes) {
-    NCF_FUNCTION("QuickTimeClip::GetDataSizePerSample");
-    CHK_PTR(dataSizeInBytes);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetDataSizePerSample(sampleNum, dataSizeInBytes);
+    return AskSampleTable(
+        "QuickTimeClip::GetDataSizePerSample", qtTrack, dataSizeInBytes, "dataSizeInBytes",
+        [&](auto& table) { return table->GetDataSizePerSample(sampleNum, dataSizeInBytes); });
 }
 
 NCFRESULT QuickTimeClip::GetDisplayOffset(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
                                           ncfSInt64* outOffset) {
-    NCF_FUNCTION("QuickTimeClip::GetDisplayOffset");
-    CHK_PTR(outOffset);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetDisplayOffset(sampleNum, outOffset);
+    return AskSampleTable(
+        "QuickTimeClip::GetDisplayOffset", qtTrack, outOffset, "outOffset",
+        [&](auto& table) { return table->GetDisplayOffset(sampleNum, outOffset); });
 }
 
 NCFRESULT QuickTimeClip::GetDecodeDuration(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
                                            ncfSInt64* decodeDuration) {
-    NCF_FUNCTION("QuickTimeClip::GetDecodeDuration");
-    CHK_PTR(decodeDuration);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetDecodeDuration(sampleNum, decodeDuration);
+    return AskSampleTable(
+        "QuickTimeClip::GetDecodeDuration", qtTrack, decodeDuration, "decodeDuration",
+        [&](auto& table) { return table->GetDecodeDuration(sampleNum, decodeDuration); });
 }
 
 NCFRESULT QuickTimeClip::GetMaxDataSizeInBytes(ncfUInt32 qtTrack, ncfUInt32* maxDataSize) {
-    NCF_FUNCTION("QuickTimeClip::GetMaxDataSizeInBytes");
-    CHK_PTR(maxDataSize);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetMaxDataSizeInBytes(maxDataSize);
+    return AskSampleTable("QuickTimeClip::GetMaxDataSizeInBytes", qtTrack, maxDataSize,
+                          "maxDataSize",
+                          [&](auto& table) { return table->GetMaxDataSizeInBytes(maxDataSize); });
 }
 
 NCFRESULT QuickTimeClip::GetHasOutOfOrderFrameDependencies(ncfUInt32 qtTrack, ncfBool* outOfOrder) {
-    NCF_FUNCTION("QuickTimeClip::GetHasOutOfOrderFrameDependencies");
-    CHK_PTR(outOfOrder);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->GetHasOutOfOrderFrameDependencies(outOfOrder);
+    return AskSampleTable(
+        "QuickTimeClip::GetHasOutOfOrderFrameDependencies", qtTrack, outOfOrder, "outOfOrder",
+        [&](auto& table) { return table->GetHasOutOfOrderFrameDependencies(outOfOrder); });
 }
 
 NCFRESULT QuickTimeClip::DisplayTimeToFrameNum(ncfUInt32 qtTrack, ncfUInt64 displayTime,
                                                ncfUInt64* sampleNum) {
-    NCF_FUNCTION("QuickTimeClip::DisplayTimeToFrameNum");
-    CHK_PTR(sampleNum);
-    NCFSmartPtr<IQTSampleTable> sampleTable;
-    NCF_RETURN(GetSampleTable(qtTrack, sampleTable.outArg()));
-    return sampleTable->DisplayTimeToFrameNum(displayTime, sampleNum);
+    return AskSampleTable(
+        "QuickTimeClip::DisplayTimeToFrameNum", qtTrack, sampleNum, "sampleNum",
+        [&](auto& table) { return table->DisplayTimeToFrameNum(displayTime, sampleNum); });
 }

@@ -25,12 +25,14 @@ std::u16string PathText(const NMAString& path) {
     return text ? std::u16string(text) : std::u16string();
 }
 
-}  // namespace
+// A failed system call, with the system's error number and the line of the call.
+void TellSystemError(const char* what, int line = __builtin_LINE()) {
+    const ncfUInt32 error = os::LastError();
+    PluginLogger().Write(1, "SimpleFileIO error. %s HRESULT = 0x%x, %s(%d)", what, error,
+                         kSourceName, line);
+}
 
-// A failed system call, with the system's error number and the line.
-#define LOG_SYSTEM_ERROR(what)                                                            \
-    PluginLogger().Write(1, "SimpleFileIO error. " what " HRESULT = 0x%x, %s(%d)", error, \
-                         kSourceName, __LINE__)
+}  // namespace
 
 std::u16string VolumeRootOf(const std::u16string& path) {
     if (path.size() >= 3 && path[1] == u':' && path[2] == u'\\') {
@@ -49,8 +51,7 @@ SimpleFileIO::SimpleFileIO(INCFString* path)
 
 SimpleFileIO::~SimpleFileIO() {
     if (file_ != os::kNoFile && !os::Close(file_)) {
-        const ncfUInt32 error = os::LastError();
-        LOG_SYSTEM_ERROR("CloseHandle failed.");
+        TellSystemError("CloseHandle failed.");
     }
     os::FreeAligned(alignedBuffer_);
 }
@@ -62,8 +63,7 @@ void SimpleFileIO::OpenIfNeeded() {
     const std::u16string path = PathText(path_);
     file_ = os::OpenForReading(path);
     if (file_ == os::kNoFile) {
-        const ncfUInt32 error = os::LastError();
-        LOG_SYSTEM_ERROR("CreateFileW failed.");
+        TellSystemError("CreateFileW failed.");
         ThrowIfFailed(NCF_E_HANDLE);
     }
     ncfUInt32 bytesPerSector = 0;
@@ -80,8 +80,7 @@ NCFRESULT SimpleFileIO::GetFileSize(ncfUInt64* size) {
         OpenIfNeeded();
         ncfUInt64 length = 0;
         if (!os::GetFileSize(file_, &length)) {
-            const ncfUInt32 error = os::LastError();
-            LOG_SYSTEM_ERROR("GetFileInformationByHandle failed.");
+            TellSystemError("GetFileInformationByHandle failed.");
             length = 0;
         }
         fileSize_ = length;
@@ -123,18 +122,15 @@ NCFRESULT SimpleFileIO::GrowAlignedBuffer(ncfUInt32 size) {
 NCFRESULT SimpleFileIO::ReadAligned(ncfUInt64 start, void* buffer, ncfUInt32 size,
                                     ncfUInt32* bytesRead) {
     if (!os::SetPosition(file_, start)) {
-        const ncfUInt32 error = os::LastError();
-        LOG_SYSTEM_ERROR("SetFilePointerEx failed.");
+        TellSystemError("SetFilePointerEx failed.");
         return NCF_E_HANDLE;
     }
     if (!os::Read(file_, buffer, size, bytesRead)) {
-        const ncfUInt32 error = os::LastError();
-        LOG_SYSTEM_ERROR("ReadFile failed.");
+        TellSystemError("ReadFile failed.");
         return NCF_E_HANDLE;
     }
     if (*bytesRead == 0) {
-        const ncfUInt32 error = os::LastError();
-        LOG_SYSTEM_ERROR("ReadFile read 0 bytes.");
+        TellSystemError("ReadFile read 0 bytes.");
         return NMA_E_NODATA;
     }
     return NCF_OK;

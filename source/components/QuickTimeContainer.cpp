@@ -11,7 +11,6 @@
 #include "source/components/FileTypes.h"
 #include "source/components/HostServices.h"
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
@@ -33,11 +32,6 @@ NCFSmartPtr<INCFString> NewString(const ncfUTF16LiteralToUTF16& text) {
 }
 
 }  // namespace
-
-NCFRESULT CreateQuickTimeContainer(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                   void** out) {
-    return CreateInstanceOf<QuickTimeContainer>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeContainer::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {

@@ -9,15 +9,9 @@
 #include "source/clips/LoadMedia.h"
 #include "source/components/HostServices.h"
 #include "source/components/MoviePattern.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQuickTimeMasterClips(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                     void** out) {
-    return CreateInstanceOf<QuickTimeMasterClips>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeMasterClips::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {
@@ -32,14 +26,14 @@ NCFRESULT QuickTimeMasterClips::InternalQueryInterface(const GUID& iid, void** o
 }
 
 void QuickTimeMasterClips::Scan() {
-    NMAVolume volume(_folder.InArg());
+    NMAVolume volume(folder_.InArg());
     void* handle = nullptr;
     for (INCFString* file = volume.GetFirstFile(kMoviePattern, handle); file;
          file = volume.GetNextFile(handle)) {
         const NMAString name(file, kNCFUTF16);
         file->Release();
         if (!NMAStringUtils::IsStartWith(name, ".")) {
-            _MCList.push_back(NMAStringUtils::CombinePath(_folder, name));
+            _MCList.push_back(NMAStringUtils::CombinePath(folder_, name));
         }
     }
 }

@@ -25,13 +25,13 @@ public:
     NCFRESULT GetMetadata(ncfSInt32 index, IAAFFile** ppData) override;
     NCFRESULT GetClipPath(ncfSInt32 index, INCFString* path) override;
 
-    void SetFolder(const NMAString& folder) { _folder = folder; }
+    void SetFolder(const NMAString& folder) { folder_ = folder; }
     // Lists the folder's movies in the order of the file system; hidden ones
     // are skipped.
     void Scan();
 
 private:
-    NMAString _folder;
+    NMAString folder_;
     std::vector<NMAString> _MCList;  // full paths
     NCFSmartPtr<INCFComponentFactory> _pComponentFactory;
     NCFSmartPtr<INCFConsole> _pConsole;

@@ -6,15 +6,9 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/components/HostServices.h"
 #include "source/components/QuickTimeMasterClips.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQuickTimeMediaFormat(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                     void** out) {
-    return CreateInstanceOf<QuickTimeMediaFormat>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeMediaFormat::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {

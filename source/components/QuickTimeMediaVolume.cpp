@@ -9,7 +9,6 @@
 #include "source/components/MoviePattern.h"
 #include "source/components/QuickTimeMediaFormat.h"
 #include "source/components/QuickTimeVolumeInfo.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 
 namespace NMA::Impl {
@@ -24,11 +23,6 @@ INCFString* Needed(INCFString* path) {
 }
 
 }  // namespace
-
-NCFRESULT CreateQuickTimeMediaVolume(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                     void** out) {
-    return CreateInstanceOf<QuickTimeMediaVolume>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeMediaVolume::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {

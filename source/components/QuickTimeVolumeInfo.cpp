@@ -8,17 +8,11 @@
 
 #include "host_interfaces/util/NMAVolume.h"
 #include "source/components/MoviePattern.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/NCFSmartPtr.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQuickTimeVolumeInfo(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                    void** out) {
-    return CreateInstanceOf<QuickTimeVolumeInfo>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeVolumeInfo::InternalQueryInterface(const GUID& iid, void** out) {
     return QueryListedInterfaces<IVolumeInfo, IVolumeInfo2>(this, iid, out);

@@ -8,8 +8,8 @@
 #include <string>
 
 #include "source/descriptor_data/DataRecord.h"
-#include "source/descriptor_data/TextToNumber.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/TextToNumber.h"
 
 namespace {
 

@@ -6,8 +6,8 @@
 #include <vector>
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
-#include "source/clips/Rational.h"
 #include "source/descriptor_data/GenericXMLDataContainer.h"
+#include "source/plugin/Rational.h"
 
 // Answers questions about the entry of "AAFInfo.xml" that fits one video
 // compression id and one picture size. Made on the stack for one query.

@@ -7,8 +7,8 @@
 #include <cstring>
 
 #include "source/descriptor_data/AAFInfoDataContainerReader2.h"
-#include "source/descriptor_data/TextToNumber.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/TextToNumber.h"
 
 namespace {
 

@@ -24,7 +24,7 @@ struct Field {
 
 // clang-format off
 constexpr Field kPictureFields[] = {
-    {"GetEssenceContainerLabelFromVCID",
+    {kContainerLabelGetter,
      [](Reader& r, AAFInfo& i) { return r.GetEssenceContainerLabelFromVCID(&i.essenceContainerLabel); },
      Silence::kFails},
     {"GetFrameLayoutFromVCID",

@@ -10,6 +10,9 @@
 // failure ends the reading: it is given back, and `failedCall` names the
 // getter; what was read before it stays in the record.
 
+// The getter that is asked first: an entry that is not there fails with it.
+inline constexpr char kContainerLabelGetter[] = "GetEssenceContainerLabelFromVCID";
+
 // What every kind of descriptor has. An entry without a value that its kind
 // must have is a failure.
 NCFRESULT ReadPictureFields(AAFInfoDataContainerReader2& reader, bool isRGBA, AAFInfo& aafInfo,

@@ -5,10 +5,10 @@
 
 #include <cstring>
 
-#include "source/clips/Rational.h"
-#include "source/descriptor_data/TextToNumber.h"
 #include "source/descriptor_data/XMLParserHelpers.h"
+#include "source/plugin/Rational.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/TextToNumber.h"
 
 namespace {
 

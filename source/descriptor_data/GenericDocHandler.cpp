@@ -4,7 +4,6 @@
 #include "source/descriptor_data/GenericDocHandler.h"
 
 #include "source/descriptor_data/DataRecord.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::Impl {
@@ -41,11 +40,6 @@ NCFRESULT TellMessage(ncfUInt32 severity, const char* where, INCFString* message
 }
 
 }  // namespace
-
-NCFRESULT CreateGenericDocHandler(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                  void** out) {
-    return CreateInstanceOf<GenericDocHandler>(host, outer, iid, out);
-}
 
 NCFRESULT GenericDocHandler::InitializeInstance(INCFUnknown* host) {
     return host ? NCF_OK : NCF_E_POINTER;

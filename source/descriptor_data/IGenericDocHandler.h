@@ -4,6 +4,7 @@
 #pragma once
 
 #include "host_interfaces/framework/Unknown.h"
+#include "host_interfaces/media/PluginComponents.h"
 #include "source/descriptor_data/XMLDataContainer.h"
 
 namespace NMA::Impl {
@@ -19,7 +20,6 @@ protected:
 
 }  // namespace NMA::Impl
 
-inline constexpr GUID kCLSID_GenericDocHandler = ncfGuid("4E40C813-86AD-4275-92CC-3AAB04EB1689");
 inline constexpr GUID kIID_GenericDocHandler = ncfGuid("1C75F5F3-9AB9-463C-82C7-36D22D7DDAEB");
 
 namespace NMA::Impl {

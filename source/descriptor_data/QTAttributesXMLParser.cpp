@@ -3,12 +3,10 @@
 
 #include "source/descriptor_data/QTAttributesXMLParser.h"
 
-#include <cstdio>
-#include <cstdlib>
-#include <string>
-
+#include "source/plugin/GuidText.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/TextToNumber.h"
 
 namespace ParseHelperFunctions {
 namespace {
@@ -32,7 +30,7 @@ NMAString TextOf(NMAXmlElement* node) {
 }
 
 ncfSInt32 NumberOf(const NMAString& text) {
-    return static_cast<ncfSInt32>(std::strtoll(text.GetUTF8String(), nullptr, 10));
+    return static_cast<ncfSInt32>(TextToNumber(text.GetUTF8String()));
 }
 
 // A level below 1 can't be told from one that is not given.
@@ -151,30 +149,6 @@ NCFRESULT QTAttributesXMLParser::_GetDenominator(NMAXmlElement* node, ncfSInt32*
     }
     *value = NumberOf(text);
     return NCF_OK;
-}
-
-bool StringToGUID(const NMAString& text, GUID* out) {
-    std::string upper = text.GetUTF8String();
-    for (char& c : upper) {
-        if (c >= 'a' && c <= 'z') {
-            c = static_cast<char>(c - 'a' + 'A');
-        }
-    }
-    unsigned fields[11] = {};
-    const int converted =
-        std::sscanf(upper.c_str(), "%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X", &fields[0],
-                    &fields[1], &fields[2], &fields[3], &fields[4], &fields[5], &fields[6],
-                    &fields[7], &fields[8], &fields[9], &fields[10]);
-    if (converted != 11) {
-        return false;
-    }
-    out->Data1 = static_cast<ncfUInt32>(fields[0]);
-    out->Data2 = static_cast<ncfUInt16>(fields[1]);
-    out->Data3 = static_cast<ncfUInt16>(fields[2]);
-    for (int i = 0; i < 8; ++i) {
-        out->Data4[i] = static_cast<ncfUInt8>(fields[3 + i]);
-    }
-    return true;
 }
 
 }  // namespace ParseHelperFunctions

@@ -5,8 +5,8 @@
 #include <memory>
 
 #include "host_interfaces/framework/ComponentFactory.h"
-#include "source/clips/ClipRecords.h"
-#include "source/parameters/NMAXmlDoc.h"
+#include "source/parameters/xml/NMAXmlDoc.h"
+#include "source/plugin/BoundsBox.h"
 
 // What a movie's colour text says.
 struct ColorSpaceDescriptor {
@@ -54,11 +54,5 @@ private:
     std::unique_ptr<NMA::XMLUtils::NMAXmlDoc> document_;
     NMA::XMLUtils::NMAXmlElement* root_ = nullptr;  // owned by the document
 };
-
-// Reads a label of the form 8-4-4-4-12 hexadecimal digits in either case, as sscanf
-// reads numbers: one may have fewer digits, or begin with blanks, a sign or 0X,
-// which count among its digits but for the blanks. What follows the last isn't
-// looked at. false, with the output untouched, where fewer than all numbers are there.
-bool StringToGUID(const NMAString& text, GUID* out);
 
 }  // namespace ParseHelperFunctions

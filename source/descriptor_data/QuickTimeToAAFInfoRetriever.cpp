@@ -4,16 +4,14 @@
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 
 #include <atomic>
-#include <cstring>
 #include <mutex>
 #include <sstream>
 #include <string>
 
-#include "source/clips/BaseClip.h"
-#include "source/clips/FourCharText.h"
 #include "source/descriptor_data/AAFInfoFields.h"
 #include "source/descriptor_data/DataRecord.h"
 #include "source/descriptor_data/ParseAAFInfoXML.h"
+#include "source/plugin/FourCharText.h"
 #include "source/plugin/PluginFolder.h"
 #include "source/plugin/ResultChecks.h"
 
@@ -123,7 +121,7 @@ bool QuickTimeToAAFInfoRetriever::IsRGBADescriptor() const {
 // The checked statements below are logged as they are written here.
 // clang-format off
 
-NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const BaseClip* media,
+NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const DescribedPicture* media,
                                                                    AAFInfo* aafInfo,
                                                                    ncfUInt32* vcid) {
     NCF_FUNCTION("QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription");
@@ -140,7 +138,8 @@ NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const BaseCli
     }
     ncfUInt32 width = 0;
     ncfUInt32 height = 0;
-    NCF_RETURN(const_cast<BaseClip*>(media)->GetEncodedWidthAndHeight(&width, &height));
+    NCF_RETURN_TEXT("const_cast<BaseClip*>(media)->GetEncodedWidthAndHeight(&width, &height)",
+                    media->GetEncodedWidthAndHeight(&width, &height));
     const NCFRESULT layoutResult = media->GetNMAFrameLayout(&aafInfo->frameLayout);
     if (layoutResult != NCF_OK && layoutResult != NCF_E_PARAMETERNOTAVAILABLE) {
         return layoutResult;
@@ -174,8 +173,7 @@ NCFRESULT QuickTimeToAAFInfoRetriever::FillInfo(const Query& query, AAFInfo& aaf
     const char* failedCall = nullptr;
     const NCFRESULT result = ReadRecord(query, aafInfo, &failedCall);
     if (failedCall) {
-        if (result == NCF_E_NOTSUPPORTED &&
-            std::strcmp(failedCall, "GetEssenceContainerLabelFromVCID") == 0) {
+        if (result == NCF_E_NOTSUPPORTED && failedCall == kContainerLabelGetter) {
             ReportUnknownId(query);
         }
         DataRecord(kDataNotice, kGetInfo)

@@ -5,13 +5,12 @@
 #include "host_interfaces/framework/ComponentFactory.h"
 #include "host_interfaces/framework/Console.h"
 #include "host_interfaces/util/NMAString.h"
-#include "source/clips/Rational.h"
 #include "source/descriptor_data/AAFInfo.h"
+#include "source/descriptor_data/DescribedPicture.h"
 #include "source/descriptor_data/FourCharDataContainerReader.h"
 #include "source/descriptor_data/GenericXMLDataContainer.h"
 #include "source/plugin/NCFSmartPtr.h"
-
-class BaseClip;
+#include "source/plugin/Rational.h"
 
 // Tells which video compression id a clip's picture has and what the data file
 // says about that id. One object for the process, made at the first clip with
@@ -32,7 +31,8 @@ public:
     // Fills `aafInfo`, which may be null, for the picture of `media`. `vcid` is
     // written also where the record can't be filled. 0: a natively served
     // picture; NCF_E_NOTSUPPORTED: the code or its geometry is unknown.
-    NCFRESULT GetInfoFromImageDescription(const BaseClip* media, AAFInfo* aafInfo, ncfUInt32* vcid);
+    NCFRESULT GetInfoFromImageDescription(const DescribedPicture* media, AAFInfo* aafInfo,
+                                          ncfUInt32* vcid);
 
     // Kind of the record that this thread read last: to be asked right after
     // GetInfoFromImageDescription.

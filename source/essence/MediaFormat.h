@@ -4,8 +4,8 @@
 
 #include <cstddef>
 
-#include "source/clips/Rational.h"
 #include "source/plugin/PixelEnums.h"
+#include "source/plugin/Rational.h"
 
 // One way in which a track's samples can be had. Immutable once it is in a
 // track's list.

@@ -10,19 +10,19 @@
 MediaTrack::~MediaTrack() = default;
 
 ncfUInt32 MediaTrack::GetNumberOfFormats() const {
-    return static_cast<ncfUInt32>(_formats.size());
+    return static_cast<ncfUInt32>(formats_.size());
 }
 
 const std::vector<MediaFormatPtr>& MediaTrack::GetFormats() const {
-    return _formats;
+    return formats_;
 }
 
 NCFRESULT MediaTrack::GetMediaFormat(ncfUInt32 index, MediaFormatPtr& mediaFormat) const {
     NCF_FUNCTION("MediaTrack::GetMediaFormat");
-    if (index >= _formats.size()) {
+    if (index >= formats_.size()) {
         return NCF_E_INVALIDARG;
     }
-    mediaFormat = _formats[index];
+    mediaFormat = formats_[index];
     NCFASSERT(mediaFormat);
     return NCF_OK;
 }
@@ -30,12 +30,12 @@ NCFRESULT MediaTrack::GetMediaFormat(ncfUInt32 index, MediaFormatPtr& mediaForma
 template <class Format>
 void MediaTrack::AddUnlessEqual(const Format& format) {
     const bool known =
-        std::any_of(_formats.begin(), _formats.end(), [&](const MediaFormatPtr& entry) {
+        std::any_of(formats_.begin(), formats_.end(), [&](const MediaFormatPtr& entry) {
             const auto* const other = dynamic_cast<const Format*>(entry.get());
             return other && *other == format;
         });
     if (!known) {
-        _formats.push_back(MediaFormatPtr(new Format(format)));
+        formats_.push_back(MediaFormatPtr(new Format(format)));
     }
 }
 

@@ -33,24 +33,24 @@ public:
     void AddFormat(const QTImageFormat& format);
     void AddFormat(const QTAudioFormat& format);
 
-    ncfUInt32 GetSelectedIndex() const { return _selectedIndex; }
-    void SetSelectedIndex(ncfUInt32 index) { _selectedIndex = index; }
-    const MediaFormatPtr& GetSelectedFormat() const { return _selectedFormat; }
-    void SetSelectedFormat(const MediaFormatPtr& format) { _selectedFormat = format; }
+    ncfUInt32 GetSelectedIndex() const { return selectedIndex_; }
+    void SetSelectedIndex(ncfUInt32 index) { selectedIndex_ = index; }
+    const MediaFormatPtr& GetSelectedFormat() const { return selectedFormat_; }
+    void SetSelectedFormat(const MediaFormatPtr& format) { selectedFormat_ = format; }
 
 protected:
     MediaTrack() = default;
     MediaTrack(const MediaTrack&) = delete;
     MediaTrack& operator=(const MediaTrack&) = delete;
 
-    std::vector<MediaFormatPtr> _formats;
+    std::vector<MediaFormatPtr> formats_;
 
 private:
     template <class Format>
     void AddUnlessEqual(const Format& format);
 
-    ncfUInt32 _selectedIndex = 0;
-    MediaFormatPtr _selectedFormat;
+    ncfUInt32 selectedIndex_ = 0;
+    MediaFormatPtr selectedFormat_;
 };
 
 class VideoMediaTrack final : public MediaTrack {

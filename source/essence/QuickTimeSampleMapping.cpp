@@ -9,18 +9,12 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/parameters/ParametersXML.h"
 #include "source/clips/LoadMedia.h"
+#include "source/essence/MappingAttachment.h"
 #include "source/essence/ProviderLock.h"
-#include "source/parameters/QTParameters.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQuickTimeSampleMapping(INCFUnknown* host, INCFUnknown* outer, const GUID& iid,
-                                       void** out) {
-    return CreateInstanceOf<QuickTimeSampleMapping>(host, outer, iid, out);
-}
 
 NCFRESULT QuickTimeSampleMapping::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {
@@ -29,7 +23,7 @@ NCFRESULT QuickTimeSampleMapping::InitializeInstance(INCFUnknown* host) {
         }
         ThrowIfFailed(ncfQuery(host, IID_INCFComponentFactory, _pComponentFactory));
         ThrowIfFailed(ncfCreate(_pComponentFactory.inArg(), CompID_LockComponent, IID_LockComponent,
-                                _providerLock));
+                                providerLock_));
         ThrowIfFailed(ncfQuery(host, IID_INCFConsole, _pConsole));
         return NCF_OK;
     });
@@ -67,10 +61,10 @@ NCFRESULT QuickTimeSampleMapping::InternalQueryInterface(const GUID& iid, void**
 
 NCFRESULT QuickTimeSampleMapping::PrepareImageProvider() {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::InternalQueryInterface");
-    if (_imageFormatsReady) {
+    if (imageFormatsReady_) {
         return NCF_OK;
     }
-    const ProviderLock lock(_providerLock);
+    const ProviderLock lock(providerLock_);
     if (!media_) {
         NCF_RETURN(LoadMedia(_filePath, _pConsole, _pComponentFactory, media_));
     }
@@ -102,7 +96,7 @@ NCFRESULT QuickTimeSampleMapping::QueryParametersXML(void** ppvObj) {
     NCF_RETURN_TEXT("_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, IID_INCFParametersXML, ppvObj)",
                     ncfCreate(_pComponentFactory.inArg(), CompID_QTParameters, IID_INCFParametersXML, created));
     // Only the module's own parameters can be attached.
-    auto* const pParams = dynamic_cast<QTParameters*>(created.inArg());
+    auto* const pParams = dynamic_cast<MappingAttachment*>(created.inArg());
     if (!pParams) {
         return NCF_E_UNEXPECTED;
     }
@@ -130,12 +124,12 @@ NCFRESULT QuickTimeSampleMapping::SetMediaContainer(std::tr1::shared_ptr<BaseCli
 
 NCFRESULT QuickTimeSampleMapping::RefreshBasedOnUIParams() {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::RefreshBasedOnUIParams");
-    const ProviderLock lock(_providerLock);
+    const ProviderLock lock(providerLock_);
     if (!media_) {
         return NMA_E_NOTINITIALIZED;
     }
     // The fields matter even where no format came of the change.
-    if (_imageFormatsReady) {
+    if (imageFormatsReady_) {
         (void)AddDecompressorPixelFormats(FirstTrackOf(MediaTrack::kVideo), FirstAlphaTrackShown());
     } else {
         (void)AddSupportedImageFormatsBasedOnCodec();

@@ -167,20 +167,21 @@ protected:
     NCFRESULT ProvideSound(ncfUInt32 trackNMA, MediaTrack& track, ncfUInt64 sample,
                            ncfUInt64 numSamples, const NCFSmartPtr<INCFBuffer>& pBuffer);
 
+    // Names that begin with an underscore appear in the log.
     NCFSmartPtr<INCFConsole> _pConsole;
     NCFSmartPtr<INCFComponentFactory> _pComponentFactory;
     NCFSmartPtr<INCFString> _filePath;
     std::tr1::shared_ptr<BaseClip> media_;
     ncfUInt32 _codecStorageType = 2;
     ncfUInt32 _codecSupportsRGB_CCIR = 0;
-    std::vector<ncfUInt32> _codecPixelFormats;
-    std::vector<std::tr1::shared_ptr<MediaTrack>> _mediaTracks;  // by the host's track number
+    std::vector<ncfUInt32> codecPixelFormats_;
+    std::vector<std::tr1::shared_ptr<MediaTrack>> mediaTracks_;  // by the host's track number
     std::vector<ncfUInt32> _trackRemapVect;                      // likewise; built on first use
     NCFSmartPtr<QTWrapper::IQTVideoReader> _videoReaderHolder;   // from the first chosen format on
     NCFSmartPtr<QTWrapper::IQTAudioReader> _audioReaderHolder;   // from the audio query on
-    bool _imageFormatsReady = false;
-    NCFSmartPtr<INCFLock> _providerLock;
-    ncfUInt32 _levelRemap = Default_Levels;  // the clip's, as of the last look for formats
+    bool imageFormatsReady_ = false;
+    NCFSmartPtr<INCFLock> providerLock_;
+    ncfUInt32 levelRemap_ = Default_Levels;  // the clip's, as of the last look for formats
 };
 
 }  // namespace NMA::Impl

@@ -23,7 +23,7 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfAudioFormats(ncfUInt32 trackNMA, nc
         if (!IsAudioTrack(*track)) {
             return NCF_E_INVALIDARG;
         }
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         *numFormats = static_cast<ncfUInt32>(track->GetFormats().size());
         return NCF_OK;
     });
@@ -40,7 +40,7 @@ NCFRESULT QuickTimeSampleMapping::GetAudioFormat(ncfUInt32 trackNMA, ncfUInt32 f
         if (!IsAudioTrack(*track)) {
             return NCF_E_INVALIDARG;
         }
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         MediaFormatPtr mediaFormat;
         NCF_RETURN(track->GetMediaFormat(formatIndex, mediaFormat));
         const auto* const audio_format = dynamic_cast<const QTAudioFormat*>(mediaFormat.get());
@@ -63,7 +63,7 @@ NCFRESULT QuickTimeSampleMapping::SetWorkingAudioFormat(ncfUInt32 trackNMA, ncfU
         if (!IsAudioTrack(*track)) {
             return NCF_E_INVALIDARG;
         }
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         track->SetSelectedIndex(formatIndex);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));

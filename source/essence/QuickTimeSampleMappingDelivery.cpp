@@ -32,7 +32,7 @@ NCFRESULT QuickTimeSampleMapping::ProvideSampleRange(INCFAVBuffer* pAVBuffer, nc
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::ProvideSampleRange");
     return InterfaceEntry([&]() -> NCFRESULT {
         CHK_INARG(pAVBuffer);
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         ncfUInt32 trackNMA = 0;
         ncfUInt64 sample = 0;
         ncfUInt64 numSamples = 0;
@@ -89,7 +89,7 @@ NCFRESULT QuickTimeSampleMapping::ProvidePicture(MediaTrack& pictureTrack, ncfUI
     const ncfUInt32 componentType = video_format->componentFormat;
     NCFASSERT(PF_UNDEFINED != pixelFormat);
     NCFASSERT(CT_UNDEFINED != componentType);
-    RemapPixelLevels(pixelFormat, componentType, pOutputBuffer, nOutputBufSize, &_levelRemap);
+    RemapPixelLevels(pixelFormat, componentType, pOutputBuffer, nOutputBufSize, &levelRemap_);
     NCF_RETURN(pBuffer->SetComplete(kNCFBuffer_Complete, nOutputBufSize, NCF_OK));
     return NCF_OK;
 }

@@ -51,8 +51,8 @@ NCFRESULT QuickTimeSampleMapping::AddSupportedImageFormatsBasedOnCodec() {
                     ReadCodecPixelFormats(quickTimeProperty.inArg()));
     const NCFRESULT added = AddDecompressorPixelFormats(video_track, alpha_track);
 
-    _imageFormatsReady = video_track->GetNumberOfFormats() > 0;
-    if (!_imageFormatsReady) {
+    imageFormatsReady_ = video_track->GetNumberOfFormats() > 0;
+    if (!imageFormatsReady_) {
         slog::Warning(ncfFunction) << "No one image pixel format was added for video track.";
         _pConsole->Write(2, "No one image pixel format was added for video track.\n");
     }
@@ -77,9 +77,9 @@ NCFRESULT QuickTimeSampleMapping::ReadCodecPixelFormats(QuickTime::IQuickTimePro
             return result;
         }
     }
-    _codecPixelFormats.assign(codecPixelFormats_ptr ? count : 0, 0);
+    codecPixelFormats_.assign(codecPixelFormats_ptr ? count : 0, 0);
     if (codecPixelFormats_ptr) {
-        std::memcpy(_codecPixelFormats.data(), codecPixelFormats_ptr, count * sizeof(ncfUInt32));
+        std::memcpy(codecPixelFormats_.data(), codecPixelFormats_ptr, count * sizeof(ncfUInt32));
     }
     return NCF_OK;
 }
@@ -90,8 +90,8 @@ NCFRESULT QuickTimeSampleMapping::AddDecompressorPixelFormats(MediaTrack* video_
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::AddDecompressorPixelFormats");
     CHK_INARG(video_track);
     CHK_PTR(_pConsole);
-    _levelRemap = media_->GetClipParams()->levelRemap;
-    if (_codecPixelFormats.empty()) {
+    levelRemap_ = media_->GetClipParams()->levelRemap;
+    if (codecPixelFormats_.empty()) {
         NCF_RETURN(AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat, _codecSupportsRGB_CCIR));
     }
     ncfBool isMultiformat = 0;
@@ -116,7 +116,7 @@ NCFRESULT QuickTimeSampleMapping::AddDecompressorPixelFormats(MediaTrack* video_
 
 bool QuickTimeSampleMapping::AddCodecPixelFormats(MediaTrack* video_track, MediaTrack* alpha_track, bool preferredOnly) {
     bool added = false;
-    for (const ncfUInt32 fourCC : _codecPixelFormats) {
+    for (const ncfUInt32 fourCC : codecPixelFormats_) {
         if (preferredOnly && !IsPreferred(fourCC)) {
             continue;
         }

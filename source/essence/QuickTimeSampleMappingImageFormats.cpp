@@ -72,7 +72,7 @@ NCFRESULT QuickTimeSampleMapping::GetImageFormat(ncfUInt32 trackNMA, ncfUInt32 f
         CHK_INARG(fieldOrder);
         CHK_INARG(frameLayout);
         CHK_INARG(orientation);
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         MediaFormatPtr mediaFormat;
         NCF_RETURN(track->GetMediaFormat(formatIndex, mediaFormat));
         const auto* const image_format = dynamic_cast<const QTImageFormat*>(mediaFormat.get());
@@ -101,7 +101,7 @@ NCFRESULT QuickTimeSampleMapping::SetWorkingImageFormat(ncfUInt32 trackNMA, ncfU
         if (!IsPictureTrack(*track)) {
             return NCF_E_INVALIDARG;
         }
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         MediaFormatPtr mediaFormat;
         NCF_RETURN(track->GetMediaFormat(formatIndex, mediaFormat));
         const auto* const image_format = dynamic_cast<const QTImageFormat*>(mediaFormat.get());
@@ -148,7 +148,7 @@ void QuickTimeSampleMapping::GetAlignedWidth(ncfUInt32 componentType, ncfUInt32 
     if (!alignedWidth) {
         return;
     }
-    const ProviderLock lock(_providerLock);
+    const ProviderLock lock(providerLock_);
     *alignedWidth = componentType == CT_V210 ? RoundUp(width, kV210Group) : width;
 }
 
@@ -171,7 +171,7 @@ NCFRESULT QuickTimeSampleMapping::GetWorkingImageSize(ncfUInt32, ncfUInt32* widt
         }
         ncfUInt32 movieHeight = 0;
         NCF_RETURN(media_->GetEncodedWidthAndHeight(width, &movieHeight));
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         ncfUInt32 temporalFieldOrder = 0;
         NCF_RETURN(media_->GetTemporalFieldOrder(&temporalFieldOrder));
         switch (temporalFieldOrder) {
@@ -194,7 +194,7 @@ NCFRESULT QuickTimeSampleMapping::GetWorkingImageBufferRequirements(ncfUInt32 tr
         CHK_INARG(bufferStartAlignment);
         CHK_INARG(maxBufferSize);
         *bufferStartAlignment = 1;
-        const ProviderLock lock(_providerLock);
+        const ProviderLock lock(providerLock_);
         std::tr1::shared_ptr<MediaTrack> track;
         NCF_RETURN(GetMediaTrack(trackNMA, track));
         if (!IsPictureTrack(*track)) {

@@ -28,10 +28,10 @@ NCFRESULT QuickTimeSampleMapping::InitializeMediaTracks(
         slog::Warning(ncfFunction) << "videoTrackCount > 1";
     }
     for (ncfUInt32 track = 0; track < videoTrackCount; ++track) {
-        _mediaTracks.push_back(TrackPtr(new VideoMediaTrack(MediaTrack::kVideo)));
+        mediaTracks_.push_back(TrackPtr(new VideoMediaTrack(MediaTrack::kVideo)));
     }
     if (media->ShowsAlpha()) {
-        _mediaTracks.push_back(TrackPtr(new VideoMediaTrack(MediaTrack::kVideoAlpha)));
+        mediaTracks_.push_back(TrackPtr(new VideoMediaTrack(MediaTrack::kVideoAlpha)));
     }
     ncfUInt32 audioTrackCount = 0;
     NCF_RETURN(media->GetAudioTrackCount(&audioTrackCount));
@@ -39,7 +39,7 @@ NCFRESULT QuickTimeSampleMapping::InitializeMediaTracks(
         const TrackPtr audioTrack(new AudioMediaTrack);
         audioTrack->AddFormat(QTAudioFormat(SF_PCM_INT_LE, kSoundBytes, kSoundBits));
         audioTrack->AddFormat(QTAudioFormat(SF_PCM_INT_BE, kSoundBytes, kSoundBits));
-        _mediaTracks.push_back(audioTrack);
+        mediaTracks_.push_back(audioTrack);
     }
     return NCF_OK;
 }
@@ -72,16 +72,16 @@ NCFRESULT QuickTimeSampleMapping::AAFTrackToQuickTimeTrack(ncfUInt32 trackNMA,
 NCFRESULT QuickTimeSampleMapping::GetMediaTrack(
     ncfUInt32 trackNMA, std::tr1::shared_ptr<MediaTrack>& mediaTrack) const {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetMediaTrack");
-    if (trackNMA >= _mediaTracks.size()) {
+    if (trackNMA >= mediaTracks_.size()) {
         return NCF_E_INVALIDARG;
     }
-    mediaTrack = _mediaTracks[trackNMA];
+    mediaTrack = mediaTracks_[trackNMA];
     NCFASSERT(mediaTrack.get());
     return NCF_OK;
 }
 
 MediaTrack* QuickTimeSampleMapping::FirstTrackOf(ncfUInt32 trackType) const {
-    for (const std::tr1::shared_ptr<MediaTrack>& track : _mediaTracks) {
+    for (const std::tr1::shared_ptr<MediaTrack>& track : mediaTracks_) {
         if (track && track->GetTrackType() == trackType) {
             return track.get();
         }

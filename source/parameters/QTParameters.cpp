@@ -8,24 +8,19 @@
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/parameters/QTParameterNames.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::Impl {
-
-NCFRESULT CreateQTParameters(INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out) {
-    return CreateInstanceOf<QTParameters>(host, outer, iid, out);
-}
 
 NCFRESULT QTParameters::InitializeInstance(INCFUnknown* host) {
     return InterfaceEntry([&] {
         if (!host) {
             ThrowIfFailed(NCF_E_POINTER);
         }
-        ThrowIfFailed(ncfQuery(host, IID_INCFComponentFactory, _pComponentFactory));
+        ThrowIfFailed(ncfQuery(host, IID_INCFComponentFactory, componentFactory_));
         ThrowIfFailed(
-            ncfCreate(_pComponentFactory.inArg(), NCFCompID_NCFString, IID_INCFString, _setName));
+            ncfCreate(componentFactory_.inArg(), NCFCompID_NCFString, IID_INCFString, setName_));
         return NCF_OK;
     });
 }
@@ -37,14 +32,14 @@ NCFRESULT QTParameters::InternalQueryInterface(const GUID& iid, void** ppvObj) {
 NCFRESULT QTParameters::AttachToQTSampleProvider(QuickTimeSampleMapping& sampleProvider) {
     NCF_FUNCTION("NMA::Impl::QTParameters::AttachToQTSampleProvider");
     // The record of a former clip may go with its mapping.
-    _clipParams = nullptr;
-    _sampleMapping = &sampleProvider;
+    clipParams_ = nullptr;
+    sampleMapping_ = &sampleProvider;
     NCFASSERT(sampleProvider.GetMediaClip());
-    _clipParams = sampleProvider.GetMediaClip()->GetClipParams();
-    _setId = kParamSetDefault;
-    _defaultParams.levelRemap = Default_Levels;
-    _defaultParams.fieldOrderInFile = _clipParams->detectedFieldOrder;
-    _defaultParams.fieldLayout = 1;
+    clipParams_ = sampleProvider.GetMediaClip()->GetClipParams();
+    setId_ = kParamSetDefault;
+    defaultParams_.levelRemap = Default_Levels;
+    defaultParams_.fieldOrderInFile = clipParams_->detectedFieldOrder;
+    defaultParams_.fieldLayout = 1;
     return NCF_OK;
 }
 
@@ -54,7 +49,7 @@ void QTParameters::RequireClip(INCFString* xml) const {
     if (!xml) {
         ThrowIfFailed(NCF_E_INVALIDARG);
     }
-    if (!_clipParams) {
+    if (!clipParams_) {
         ThrowIfFailed(NMA_E_NOTINITIALIZED);
     }
 }
@@ -62,7 +57,7 @@ void QTParameters::RequireClip(INCFString* xml) const {
 NCFRESULT QTParameters::GetParameterValuesXML(INCFString* xml) {
     return InterfaceEntry([&] {
         RequireClip(xml);
-        if (_setId == GUID{}) {
+        if (setId_ == GUID{}) {
             ThrowIfFailed(NMA_E_NOTINITIALIZED);
         }
         const NCFSmartPtr<IParameterSuite> suite = NewSuite();
@@ -87,7 +82,7 @@ NCFRESULT QTParameters::GetDefaultValuesXML(INCFString* xml) {
     return InterfaceEntry([&] {
         RequireClip(xml);
         const NCFSmartPtr<IParameterSuite> suite = NewSuite();
-        WriteParamSet(suite.inArg(), kParamSetDefault, kDefaultSetName, _defaultParams);
+        WriteParamSet(suite.inArg(), kParamSetDefault, kDefaultSetName, defaultParams_);
         ThrowIfFailed(suite->WriteXML(xml));
         return NCF_OK;
     });
@@ -99,7 +94,7 @@ NCFRESULT QTParameters::SetParameterValuesXML(INCFString* xml) {
     return InterfaceEntry([&] {
         RequireClip(xml);
         NCFSmartPtr<IParametersReader> reader;
-        ThrowIfFailed(ncfCreate(_pComponentFactory.inArg(), CompID_ParametersReader,
+        ThrowIfFailed(ncfCreate(componentFactory_.inArg(), CompID_ParametersReader,
                                 IID_ParametersReader, reader));
         void* handler = nullptr;
         ThrowIfFailed(InternalQueryInterface(IID_IParametersHandler, &handler));
@@ -109,7 +104,7 @@ NCFRESULT QTParameters::SetParameterValuesXML(INCFString* xml) {
         // The events below come during this call.
         ThrowIfFailed(reader->Parse(xml));
         // The values are taken whether or not formats could be found for them.
-        (void)_sampleMapping->RefreshBasedOnUIParams();
+        (void)sampleMapping_->RefreshBasedOnUIParams();
         return NCF_OK;
     });
 }
@@ -123,11 +118,11 @@ NCFRESULT QTParameters::ParametersUnsupportedOperation(void*) {
 // is touched: hosts hand values over next, and the mapping follows those.
 NCFRESULT QTParameters::ResetParameters() {
     return InterfaceEntry([&] {
-        if (!_clipParams) {
+        if (!clipParams_) {
             ThrowIfFailed(NMA_E_NOTINITIALIZED);
         }
-        *_clipParams = _defaultParams;
-        ThrowIfFailed(_setName->AssignUTF8(kNCFUTF8, kDefaultSetName, kNCFZeroTerminated));
+        *clipParams_ = defaultParams_;
+        ThrowIfFailed(setName_->AssignUTF8(kNCFUTF8, kDefaultSetName, kNCFZeroTerminated));
         return NCF_OK;
     });
 }

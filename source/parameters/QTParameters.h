@@ -6,6 +6,7 @@
 #include "host_interfaces/parameters/ParameterSuite.h"
 #include "host_interfaces/parameters/ParametersReader.h"
 #include "host_interfaces/parameters/ParametersXML.h"
+#include "source/essence/MappingAttachment.h"
 #include "source/essence/QuickTimeSampleMapping.h"
 
 namespace NMA::Impl {
@@ -20,7 +21,8 @@ namespace NMA::Impl {
 //
 // Sources by concern: the object and the interface (.cpp), ...Documents for what
 // the suite is told, ...Events for what the reader tells.
-class QTParameters final : public CNCFComponent<INCFParametersXML, IParametersHandler> {
+class QTParameters final : public CNCFComponent<INCFParametersXML, IParametersHandler>,
+                           public MappingAttachment {
 public:
     explicit QTParameters(INCFUnknown* outer) : CNCFComponent(outer) {}
 
@@ -29,7 +31,7 @@ public:
 
     // Takes the parameters of the mapping's clip, and what its file says as
     // their defaults. Until then all XML work is refused.
-    NCFRESULT AttachToQTSampleProvider(QuickTimeSampleMapping& sampleProvider);
+    NCFRESULT AttachToQTSampleProvider(QuickTimeSampleMapping& sampleProvider) override;
 
     // --- INCFParametersXML -------------------------------------------------------
 
@@ -61,15 +63,15 @@ private:
                        const ClipParams& values);
     void WriteParameterDescription(IParameterSuite* suite);
 
-    NCFSmartPtr<INCFString> _setName;  // of the current set; a text of its own
-    NCFSmartPtr<QuickTimeSampleMapping> _sampleMapping;
-    NCFSmartPtr<INCFComponentFactory> _pComponentFactory;
-    ClipParams* _clipParams = nullptr;  // the clip's record, null before attaching
+    NCFSmartPtr<INCFString> setName_;  // of the current set; a text of its own
+    NCFSmartPtr<QuickTimeSampleMapping> sampleMapping_;
+    NCFSmartPtr<INCFComponentFactory> componentFactory_;
+    ClipParams* clipParams_ = nullptr;  // the clip's record, null before attaching
     // What "Default Settings" means for this clip.
-    ClipParams _defaultParams = {kProgressive, 16, 2, kFieldOrderUndetermined};
-    GUID _setId{};
-    bool _inComponent = false;  // inside this module's part of a document
-    bool _inSet = false;        // inside a set whose values are for taking
+    ClipParams defaultParams_ = {kProgressive, 16, 2, kFieldOrderUndetermined};
+    GUID setId_{};
+    bool inComponent_ = false;  // inside this module's part of a document
+    bool inSet_ = false;        // inside a set whose values are for taking
 };
 
 }  // namespace NMA::Impl

@@ -62,7 +62,7 @@ void PutNumber(IParameterValue* value, ncfUInt32 number) {
 NCFSmartPtr<IParameterSuite> QTParameters::NewSuite() {
     NCFSmartPtr<IParameterSuite> suite;
     ThrowIfFailed(
-        ncfCreate(_pComponentFactory.inArg(), CompID_ParameterSuite, IID_ParameterSuite, suite));
+        ncfCreate(componentFactory_.inArg(), CompID_ParameterSuite, IID_ParameterSuite, suite));
     ThrowIfFailed(suite->SetComponentId(CompID_QuickTimeSampleMapping));
     ThrowIfFailed(suite->Prepare(0));
     return suite;
@@ -71,7 +71,7 @@ NCFSmartPtr<IParameterSuite> QTParameters::NewSuite() {
 NCFSmartPtr<IParameterValue> QTParameters::NewValue() {
     NCFSmartPtr<IValueFactory> factory;
     ThrowIfFailed(
-        ncfCreate(_pComponentFactory.inArg(), kValueTypeUInt32, IID_ValueFactory, factory));
+        ncfCreate(componentFactory_.inArg(), kValueTypeUInt32, IID_ValueFactory, factory));
     NCFSmartPtr<IParameterValue> value;
     ThrowIfFailed(factory->CreateValue(value.outArg()));
     return value;
@@ -81,11 +81,11 @@ void QTParameters::WriteCurrentSet(IParameterSuite* suite) {
     // The name in the encoding that suites take, whatever the reader's was.
     NCFSmartPtr<INCFString> copy;
     ncfUTF8* name = nullptr;
-    if (!_setName->IsEmpty()) {
-        ThrowIfFailed(_setName->ConvertCopy(kNCFUTF8, copy.outArg()));
+    if (!setName_->IsEmpty()) {
+        ThrowIfFailed(setName_->ConvertCopy(kNCFUTF8, copy.outArg()));
         ThrowIfFailed(copy->GetRawUTF8(&name));
     }
-    WriteParamSet(suite, _setId, name, *_clipParams);
+    WriteParamSet(suite, setId_, name, *clipParams_);
 }
 
 void QTParameters::WriteParamSet(IParameterSuite* suite, const GUID& setId, const char* name,
@@ -116,7 +116,7 @@ void QTParameters::WriteParameterDescription(IParameterSuite* suite) {
 
     ThrowIfFailed(suite->AddParameter(kParamFieldOrdering, kInternalNames[kFieldOrderingName],
                                       "Field Ordering", 0, kParamTypeChoice));
-    AddChoices(suite, kFieldOrderingTexts, kFieldOrderingValues, _clipParams->detectedFieldOrder);
+    AddChoices(suite, kFieldOrderingTexts, kFieldOrderingValues, clipParams_->detectedFieldOrder);
     const NCFSmartPtr<IParameterValue> value = NewValue();
     for (const Dependency& dependency : kLayoutDependencies) {
         PutNumber(value.inArg(), dependency.fieldOrder);
@@ -130,7 +130,7 @@ void QTParameters::WriteParameterDescription(IParameterSuite* suite) {
 
     ThrowIfFailed(suite->AddParameter(kParamLevelRemapping, kInternalNames[kLevelRemappingName],
                                       "GFX-Video Level", 0, kParamTypeChoice));
-    AddChoices(suite, kLevelRemappingTexts, kLevelRemappingValues, _defaultParams.levelRemap);
+    AddChoices(suite, kLevelRemappingTexts, kLevelRemappingValues, defaultParams_.levelRemap);
     ThrowIfFailed(suite->EndDescription());
 }
 

@@ -31,42 +31,42 @@ constexpr Target kTargets[] = {
 }  // namespace
 
 NCFRESULT QTParameters::BeginDocument() {
-    _inComponent = false;
+    inComponent_ = false;
     return NCF_OK;
 }
 
 NCFRESULT QTParameters::BeginComponent(const GUID& component) {
-    _inComponent = component == CompID_QuickTimeSampleMapping;
-    _inSet = false;
+    inComponent_ = component == CompID_QuickTimeSampleMapping;
+    inSet_ = false;
     return NCF_OK;
 }
 
 NCFRESULT QTParameters::EndComponent(ncfUInt32 isWhole) {
     if (isWhole) {
-        _inComponent = false;
-        _inSet = false;
+        inComponent_ = false;
+        inSet_ = false;
     }
     return NCF_OK;
 }
 
 NCFRESULT QTParameters::BeginParamSet(const GUID& set, INCFString* name, float, ncfUInt32 state) {
     return InterfaceEntry([&] {
-        _inSet = state == kSetWithValues;
+        inSet_ = state == kSetWithValues;
         if (state == kSetNotInUse) {
             return NCF_OK;
         }
-        _setId = set;
+        setId_ = set;
         // The text is copied: the reader's string may change under this object,
         // and a reset would write into it.
-        ThrowIfFailed(name ? _setName->Assign(name)
-                           : _setName->AssignUTF8(kNCFUTF8, "", kNCFZeroTerminated));
+        ThrowIfFailed(name ? setName_->Assign(name)
+                           : setName_->AssignUTF8(kNCFUTF8, "", kNCFZeroTerminated));
         return NCF_OK;
     });
 }
 
 NCFRESULT QTParameters::ParamValue(const GUID& parameter, IParameterValue* value) {
     return InterfaceEntry([&]() -> NCFRESULT {
-        if (!_inComponent || !_inSet || !_clipParams) {
+        if (!inComponent_ || !inSet_ || !clipParams_) {
             return NCF_OK;
         }
         for (const Target& target : kTargets) {
@@ -77,7 +77,7 @@ NCFRESULT QTParameters::ParamValue(const GUID& parameter, IParameterValue* value
                 // The number is taken as it comes, a choice or not.
                 ncfUInt32 number = 0;
                 ThrowIfFailed(value->GetData(&number, sizeof number));
-                _clipParams->*target.field = number;
+                clipParams_->*target.field = number;
                 return NCF_OK;
             }
         }
@@ -86,8 +86,8 @@ NCFRESULT QTParameters::ParamValue(const GUID& parameter, IParameterValue* value
 }
 
 NCFRESULT QTParameters::EndDocument() {
-    _inComponent = false;
-    _inSet = false;
+    inComponent_ = false;
+    inSet_ = false;
     return NCF_OK;
 }
 

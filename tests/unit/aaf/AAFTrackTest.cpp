@@ -100,11 +100,5 @@ TEST_F(AAFTrackTest, AnEmptyMobIsUnexpected) {
               NCF_E_UNEXPECTED);
 }
 
-TEST(SlotLabel, FillsItsFormatAndNeverOverruns) {
-    EXPECT_EQ(SlotLabel(L"V%d", 3, 64), L"V3");
-    EXPECT_EQ(SlotLabel(L"AuxTC%d", 12, 256), L"AuxTC12");
-    EXPECT_LE(SlotLabel(L"AuxTC%d", 123456, 8).size(), 7u);
-}
-
 }  // namespace
 }  // namespace NMA::Impl

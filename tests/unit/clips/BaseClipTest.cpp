@@ -4,6 +4,7 @@
 // What is common to both kinds of clip, seen through the one that reads headers:
 // services made on first use, sound beside picture, names.
 
+#include "source/clips/NativeCodecs.h"
 #include "tests/unit/clips/ClipFixture.h"
 #include "tests/unit/clips/FakeWrapper.h"
 
@@ -123,15 +124,15 @@ TEST_F(BaseClipServices, HandsOutItsPath) {
 }
 
 TEST(BaseClip, KnowsTwoRawCodecsByTheirExactCode) {
-    EXPECT_TRUE(BaseClip::IsNativeQuickTimeCodec(0x57524157));   // 'WRAW'
-    EXPECT_TRUE(BaseClip::IsNativeQuickTimeCodec(0x72617720));   // 'raw '
-    EXPECT_FALSE(BaseClip::IsNativeQuickTimeCodec(0x52415720));  // 'RAW '
-    EXPECT_FALSE(BaseClip::IsNativeQuickTimeCodec(0));
+    EXPECT_TRUE(IsNativeQuickTimeCodec(0x57524157));   // 'WRAW'
+    EXPECT_TRUE(IsNativeQuickTimeCodec(0x72617720));   // 'raw '
+    EXPECT_FALSE(IsNativeQuickTimeCodec(0x52415720));  // 'RAW '
+    EXPECT_FALSE(IsNativeQuickTimeCodec(0));
 }
 
 TEST(BaseClip, NamesOtherCodecsUnknown) {
     NCFSmartPtr<INCFString> name = HostText("");
-    EXPECT_EQ(BaseClip::GetNativeQuickTimeCodecName(0x61766331, name), NCF_OK);
+    EXPECT_EQ(GetNativeQuickTimeCodecName(0x61766331, name), NCF_OK);
     EXPECT_EQ(TextOf(name.inArg()), "Unknown Codec");
 }
 

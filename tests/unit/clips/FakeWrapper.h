@@ -10,7 +10,7 @@
 #include <vector>
 
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
-#include "source/clips/Rational.h"
+#include "source/plugin/Rational.h"
 #include "tests/support/fakes/FakeHost.h"
 #include "tests/support/fakes/parser/FakeCalls.h"
 

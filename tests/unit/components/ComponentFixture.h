@@ -15,8 +15,10 @@
 #include "host_interfaces/media/MediaVolume.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/util/NMAUtil.h"
+#include "source/components/QuickTimeMasterClips.h"
+#include "source/components/QuickTimeMediaFormat.h"
+#include "source/components/QuickTimeVolumeInfo.h"
 #include "source/plugin/CNCFUnknown.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/NCFSmartPtr.h"
 #include "tests/support/TestFolder.h"
 #include "tests/support/fakes/RecordingLogger.h"
@@ -27,9 +29,9 @@ class ComponentFixture : public ::testing::Test {
 protected:
     ComponentFixture() {
         NMAInitialize(host.factory());
-        serve(NMA::CompID_QuickTimeVolumeInfo, NMA::Impl::CreateQuickTimeVolumeInfo);
-        serve(NMA::CompID_QuickTimeMediaFormat, NMA::Impl::CreateQuickTimeMediaFormat);
-        serve(NMA::CompID_QuickTimeMasterClips, NMA::Impl::CreateQuickTimeMasterClips);
+        serve(NMA::CompID_QuickTimeVolumeInfo, CreateInstanceOf<NMA::Impl::QuickTimeVolumeInfo>);
+        serve(NMA::CompID_QuickTimeMediaFormat, CreateInstanceOf<NMA::Impl::QuickTimeMediaFormat>);
+        serve(NMA::CompID_QuickTimeMasterClips, CreateInstanceOf<NMA::Impl::QuickTimeMasterClips>);
     }
     ~ComponentFixture() override {
         NMATerminate();

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "source/components/QuickTimeContainer.h"
+#include "source/essence/QuickTimeSampleMapping.h"
 
 #include "host_interfaces/aaf/AAFFile.h"
 #include "host_interfaces/aaf/AAFMasterMobs.h"
@@ -76,7 +77,7 @@ protected:
         });
     }
     NCFSmartPtr<NMA::IMediaContainer3> container() {
-        return make<NMA::IMediaContainer3>(NMA::Impl::CreateQuickTimeContainer);
+        return make<NMA::IMediaContainer3>(CreateInstanceOf<NMA::Impl::QuickTimeContainer>);
     }
     void useCapability(ncfUInt32 value) {
         host.maker(CompID_Capability, [value](const GUID&, void** out) {
@@ -85,7 +86,8 @@ protected:
         });
     }
     void serveMappings() {
-        serve(NMA::CompID_QuickTimeSampleMapping, NMA::Impl::CreateQuickTimeSampleMapping);
+        serve(NMA::CompID_QuickTimeSampleMapping,
+              CreateInstanceOf<NMA::Impl::QuickTimeSampleMapping>);
         host.maker(CompID_LockComponent, [](const GUID&, void** out) {
             *out = static_cast<INCFLock*>(new FakeLock);
             return NCF_OK;
@@ -128,8 +130,8 @@ TEST_F(Container, GivesItsFlagAndRefusesWhatItDoesNotDo) {
 TEST_F(Container, NeedsHostFactoryAndConsoleButNoSettings) {
     void* out = nullptr;
     const auto create = [&](INCFUnknown* unknown) {
-        return NMA::Impl::CreateQuickTimeContainer(unknown, nullptr, NMA::IID_IMediaContainer3,
-                                                   &out);
+        return CreateInstanceOf<NMA::Impl::QuickTimeContainer>(unknown, nullptr,
+                                                               NMA::IID_IMediaContainer3, &out);
     };
     EXPECT_EQ(create(nullptr), NCF_E_POINTER);
     host.refuseQuery(IID_INCFConsole, NCF_E_NOINTERFACE);

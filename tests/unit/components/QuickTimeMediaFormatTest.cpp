@@ -1,7 +1,9 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "source/components/QuickTimeMasterClips.h"
 #include "source/components/QuickTimeMediaFormat.h"
+#include "source/components/QuickTimeMediaVolume.h"
 
 #include <algorithm>
 
@@ -22,7 +24,8 @@ class MediaFormat : public ComponentFixture {
 protected:
     NCFSmartPtr<NMA::IMediaFormat> formatFor(const std::filesystem::path& of) {
         NCFSmartPtr<NMA::IMediaFormat> format;
-        const auto volume = make<NMA::IMediaVolume>(NMA::Impl::CreateQuickTimeMediaVolume);
+        const auto volume =
+            make<NMA::IMediaVolume>(CreateInstanceOf<NMA::Impl::QuickTimeMediaVolume>);
         EXPECT_EQ(volume->GetMediaFormat(path(of).inArg(), format.outArg()), NCF_OK);
         return format;
     }
@@ -40,7 +43,7 @@ protected:
 };
 
 TEST_F(MediaFormat, GivesItsFlags) {
-    const auto format = make<NMA::IMediaFormat>(NMA::Impl::CreateQuickTimeMediaFormat);
+    const auto format = make<NMA::IMediaFormat>(CreateInstanceOf<NMA::Impl::QuickTimeMediaFormat>);
     EXPECT_EQ(format->FormatFlagA(), 1);
     EXPECT_EQ(format->FormatFlagB(), 0);
     EXPECT_EQ(format->FormatFlagC(), 0);
@@ -70,7 +73,7 @@ TEST_F(MediaFormat, JoinsFolderAndNameWithOneSeparator) {
 }
 
 TEST_F(MediaFormat, ScansTheEmptyPathWhenNoneWasSet) {
-    const auto format = make<NMA::IMediaFormat>(NMA::Impl::CreateQuickTimeMediaFormat);
+    const auto format = make<NMA::IMediaFormat>(CreateInstanceOf<NMA::Impl::QuickTimeMediaFormat>);
     NCFSmartPtr<NMA::IAAFClips> clips;
     ASSERT_EQ(format->GetAAFClips(clips.outArg()), NCF_OK);
     EXPECT_EQ(clips->GetCount(), 0);
@@ -99,7 +102,8 @@ TEST_F(MediaFormat, NeedsAnOutput) {
 
 TEST_F(MediaFormat, NeedsAHost) {
     void* out = nullptr;
-    EXPECT_EQ(NMA::Impl::CreateQuickTimeMediaFormat(nullptr, nullptr, NMA::IID_IMediaFormat, &out),
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeMediaFormat>(nullptr, nullptr,
+                                                                NMA::IID_IMediaFormat, &out),
               NCF_E_POINTER);
 }
 
@@ -155,12 +159,13 @@ TEST_F(MasterClips, GivesTheCodeOfAFileThatIsGone) {
 
 TEST_F(MasterClips, NeedsAHostWithAConsole) {
     void* out = nullptr;
-    EXPECT_EQ(NMA::Impl::CreateQuickTimeMasterClips(nullptr, nullptr, NMA::IID_IAAFClips, &out),
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeMasterClips>(nullptr, nullptr,
+                                                                NMA::IID_IAAFClips, &out),
               NCF_E_POINTER);
     host.refuseQuery(IID_INCFConsole, NCF_E_NOINTERFACE);
-    EXPECT_EQ(
-        NMA::Impl::CreateQuickTimeMasterClips(host.unknown(), nullptr, NMA::IID_IAAFClips, &out),
-        NCF_E_NOINTERFACE);
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeMasterClips>(host.unknown(), nullptr,
+                                                                NMA::IID_IAAFClips, &out),
+              NCF_E_NOINTERFACE);
 }
 
 // --- sequences ---------------------------------------------------------------------------

@@ -13,7 +13,7 @@ namespace {
 class MediaVolume : public ComponentFixture {
 protected:
     NCFSmartPtr<NMA::IMediaVolume> volume =
-        make<NMA::IMediaVolume>(NMA::Impl::CreateQuickTimeMediaVolume);
+        make<NMA::IMediaVolume>(CreateInstanceOf<NMA::Impl::QuickTimeMediaVolume>);
 };
 
 TEST_F(MediaVolume, ClaimsAFolderByItsFirstMovieWhateverIsInIt) {
@@ -126,12 +126,13 @@ TEST_F(MediaVolume, NothingMadeIsUnexpected) {
 
 TEST_F(MediaVolume, NeedsAHostWithAFactory) {
     void* out = nullptr;
-    EXPECT_EQ(NMA::Impl::CreateQuickTimeMediaVolume(nullptr, nullptr, NMA::IID_IMediaVolume, &out),
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeMediaVolume>(nullptr, nullptr,
+                                                                NMA::IID_IMediaVolume, &out),
               NCF_E_POINTER);
     host.refuseQuery(IID_INCFComponentFactory, NCF_E_NOINTERFACE);
-    EXPECT_EQ(
-        NMA::Impl::CreateQuickTimeMediaVolume(host.unknown(), nullptr, NMA::IID_IMediaVolume, &out),
-        NCF_E_NOINTERFACE);
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeMediaVolume>(host.unknown(), nullptr,
+                                                                NMA::IID_IMediaVolume, &out),
+              NCF_E_NOINTERFACE);
     EXPECT_EQ(out, nullptr);
 }
 

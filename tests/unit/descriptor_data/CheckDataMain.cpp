@@ -9,8 +9,8 @@
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/framework/Host.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
+#include "source/descriptor_data/GenericDocHandler.h"
 #include "source/descriptor_data/IGenericDocHandler.h"
-#include "source/plugin/CreationFunctions.h"
 #include "tests/unit/descriptor_data/DataCheck.h"
 
 int main(int argc, char** argv) {
@@ -20,7 +20,8 @@ int main(int argc, char** argv) {
     }
     host::Host host;
     host::RegisterXmlComponents(host);
-    host.RegisterComponent(kCLSID_GenericDocHandler, NMA::Impl::CreateGenericDocHandler);
+    host.RegisterComponent(kCLSID_GenericDocHandler,
+                           CreateInstanceOf<NMA::Impl::GenericDocHandler>);
     NMAInitialize(&host.factory());
     const std::vector<std::string> findings = CheckData(&host.factory(), argv[1], argv[2]);
     NMATerminate();

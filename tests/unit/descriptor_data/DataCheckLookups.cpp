@@ -9,10 +9,10 @@
 #include <memory>
 #include <set>
 
-#include "source/clips/Rational.h"
 #include "source/descriptor_data/AAFInfoDataContainerReader2.h"
 #include "source/descriptor_data/FourCharDataContainerReader.h"
 #include "source/descriptor_data/ParseAAFInfoXML.h"
+#include "source/plugin/Rational.h"
 #include "tests/unit/descriptor_data/DataCheck.h"
 
 namespace data_check {

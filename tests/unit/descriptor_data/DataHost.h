@@ -11,9 +11,9 @@
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/framework/Ref.h"
 #include "reference_host/xml/SaxParser.h"
+#include "source/descriptor_data/GenericDocHandler.h"
 #include "source/descriptor_data/IGenericDocHandler.h"
 #include "source/plugin/CNCFUnknown.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/PluginFolder.h"
 #include "tests/support/TestFolder.h"
 #include "tests/support/fakes/RecordingLogger.h"
@@ -29,7 +29,8 @@ protected:
         host.name(kCLSID_GenericDocHandler, "handler");
         host.name(NCFCompID_NCFString, "string");
         host.maker(kCLSID_GenericDocHandler, [this](const GUID& iid, void** out) {
-            return NMA::Impl::CreateGenericDocHandler(host.unknown(), nullptr, iid, out);
+            return CreateInstanceOf<NMA::Impl::GenericDocHandler>(host.unknown(), nullptr, iid,
+                                                                  out);
         });
         UseHostParser();
     }

@@ -9,7 +9,7 @@
 #include <memory>
 #include <set>
 
-#include "source/clips/Rational.h"
+#include "source/plugin/Rational.h"
 #include "tests/unit/descriptor_data/DataHost.h"
 
 namespace {

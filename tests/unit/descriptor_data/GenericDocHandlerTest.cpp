@@ -81,7 +81,8 @@ TEST_F(GenericDocHandlerTest, AnswersItsThreeInterfacesAndNoOther) {
 TEST_F(GenericDocHandlerTest, NeedsAHost) {
     void* out = &container_;
     const ncfUInt32 before = GetObjectCount();
-    EXPECT_EQ(NMA::Impl::CreateGenericDocHandler(nullptr, nullptr, kIID_SaxDocumentHandler, &out),
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::GenericDocHandler>(nullptr, nullptr,
+                                                             kIID_SaxDocumentHandler, &out),
               ncf_detail::Code(0x80000005));
     EXPECT_EQ(out, nullptr);
     EXPECT_EQ(GetObjectCount(), before);

@@ -123,12 +123,12 @@ TEST_F(RetrieverTest, AsksTheClipInOrder) {
 
 TEST_F(RetrieverTest, EachFailureOfTheClipIsLoggedAndReturned) {
     EXPECT_EQ(Init(Entry("1", "CDCI", Join(CDCIValues()))), NCF_OK);
-    const std::pair<NCFRESULT FakeClip::*, const char*> steps[] = {
-        {&FakeClip::codeResult, "media->GetDataFormat(&fourCC)"},
-        {&FakeClip::vendorResult, "media->GetVendor(&vendor)"},
-        {&FakeClip::sizeResult,
+    const std::pair<NCFRESULT FakePicture::*, const char*> steps[] = {
+        {&FakePicture::codeResult, "media->GetDataFormat(&fourCC)"},
+        {&FakePicture::vendorResult, "media->GetVendor(&vendor)"},
+        {&FakePicture::sizeResult,
          "const_cast<BaseClip*>(media)->GetEncodedWidthAndHeight(&width, &height)"},
-        {&FakeClip::rateResult, "media->GetEditRate(&movieEditRate)"}};
+        {&FakePicture::rateResult, "media->GetEditRate(&movieEditRate)"}};
     for (const auto& [result, expression] : steps) {
         clip_.*result = NCF_E_NOTFOUND;
         log.clear();

@@ -6,7 +6,7 @@
 
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "tests/unit/descriptor_data/AAFInfoFile.h"
-#include "tests/unit/descriptor_data/FakeClip.h"
+#include "tests/unit/descriptor_data/FakePicture.h"
 
 inline constexpr char kGetInfo[] = "QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription";
 
@@ -103,7 +103,7 @@ protected:
     static bool IsRGBA() { return QuickTimeToAAFInfoRetriever::GetInstance()->IsRGBADescriptor(); }
 
     struct Clip {
-        FakeClip clip;
+        FakePicture clip;
         Clip() {
             clip.code = Code("code");
             clip.vendor = Code("appl");
@@ -113,7 +113,7 @@ protected:
         }
     };
     Clip holder_;
-    FakeClip& clip_ = holder_.clip;
+    FakePicture& clip_ = holder_.clip;
     AAFInfo info_;
     ncfUInt32 id_ = 77;
 };

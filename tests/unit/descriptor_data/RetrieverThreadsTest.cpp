@@ -12,12 +12,12 @@
 #include "reference_host/framework/Host.h"
 #include "reference_host/framework/Ref.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
+#include "source/descriptor_data/GenericDocHandler.h"
 #include "source/descriptor_data/IGenericDocHandler.h"
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
-#include "source/plugin/CreationFunctions.h"
 #include "source/plugin/PluginFolder.h"
 #include "tests/support/fakes/FakeHost.h"
-#include "tests/unit/descriptor_data/FakeClip.h"
+#include "tests/unit/descriptor_data/FakePicture.h"
 
 namespace {
 
@@ -31,7 +31,7 @@ int DescribeMany(INCFComponentFactory* factory, ncfUInt32 code, ncfUInt32 width,
     for (int i = 0; i < 20; ++i) {
         wrong += QuickTimeToAAFInfoRetriever::Init(nullptr, factory, "FourCharMapper.xml",
                                                    "AAFInfo.xml") != NCF_OK;
-        FakeClip clip;
+        FakePicture clip;
         clip.code = code;
         clip.width = width;
         clip.height = height;
@@ -49,7 +49,8 @@ int DescribeMany(INCFComponentFactory* factory, ncfUInt32 code, ncfUInt32 width,
 TEST(RetrieverThreads, EachClipGetsItsOwnAnswerAndFlag) {
     host::Host host;
     host::RegisterXmlComponents(host);
-    host.RegisterComponent(kCLSID_GenericDocHandler, NMA::Impl::CreateGenericDocHandler);
+    host.RegisterComponent(kCLSID_GenericDocHandler,
+                           CreateInstanceOf<NMA::Impl::GenericDocHandler>);
     ASSERT_GE(NMAInitialize(&host.factory()), 0);
     INCFString* const folder = MakeHostString(SHIPPED_DATA_FOLDER "/");
     SetPluginFolder(folder);

@@ -10,7 +10,7 @@
 
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "tests/unit/descriptor_data/DataHost.h"
-#include "tests/unit/descriptor_data/FakeClip.h"
+#include "tests/unit/descriptor_data/FakePicture.h"
 #include "tests/unit/descriptor_data/KnownRecords.h"
 
 namespace {
@@ -45,7 +45,7 @@ protected:
         bool isMPEG;
         bool isRGBA;
     };
-    static Answer Ask(FakeClip& clip) {
+    static Answer Ask(FakePicture& clip) {
         Answer answer;
         QuickTimeToAAFInfoRetriever* const retriever = QuickTimeToAAFInfoRetriever::GetInstance();
         answer.result = retriever->GetInfoFromImageDescription(&clip, &answer.info, &answer.id);
@@ -54,7 +54,7 @@ protected:
         return answer;
     }
     static Answer Ask(const KnownRecord& record) {
-        FakeClip clip;
+        FakePicture clip;
         clip.code = Number(record.code);
         clip.vendor = Number(record.vendor);
         clip.width = record.width;
@@ -170,7 +170,7 @@ TEST_F(ShippedData, CodesThatAreNotNativeGoToTheProvider) {
 }
 
 TEST_F(ShippedData, ProResOfAnotherRasterIsAskedOfTheMovie) {
-    FakeClip clip;
+    FakePicture clip;
     clip.code = Number("apcn");
     clip.width = 2048;
     clip.height = 1080;
@@ -188,7 +188,7 @@ TEST_F(ShippedData, ProResOfAnotherRasterIsAskedOfTheMovie) {
 
 TEST_F(ShippedData, CodesOfManyRastersRefuseARasterThatTheyLack) {
     for (const char* code : {"ap4x", "2vuy", "v210", "2Vuy", "ai56"}) {
-        FakeClip clip;
+        FakePicture clip;
         clip.code = Number(code);
         clip.width = 720;
         clip.height = 500;

@@ -97,7 +97,7 @@ TEST_F(GuardedOperations, OfSampleTables) {
 
 TEST_F(GuardedOperations, OfPictures) {
     Expect("SetWorkingImageFormat", [this] {
-        mapping->_mediaTracks[0]->SetSelectedFormat(MediaFormatPtr());
+        mapping->mediaTracks_[0]->SetSelectedFormat(MediaFormatPtr());
         return mapping->SetWorkingImageFormat(0, 1);
     });
     Expect("GetWorkingImageSize",
@@ -108,9 +108,9 @@ TEST_F(GuardedOperations, OfPictures) {
         return mapping->GetImageFormat(0, 0, &number, &number, &number, &number, &number, &number,
                                        &number, &number);
     });
-    mapping->_mediaTracks[0].reset(new BrokenTrack([] { throw NCF_E_HANDLE; }));
+    mapping->mediaTracks_[0].reset(new BrokenTrack([] { throw NCF_E_HANDLE; }));
     EXPECT_EQ(mapping->GetNumberOfImageFormats(0, &number), NCF_E_HANDLE);
-    mapping->_mediaTracks[0].reset(new BrokenTrack([] { throw std::runtime_error("broken"); }));
+    mapping->mediaTracks_[0].reset(new BrokenTrack([] { throw std::runtime_error("broken"); }));
     EXPECT_EQ(mapping->GetNumberOfImageFormats(0, &number), NCF_E_UNEXPECTED);
 }
 
@@ -132,7 +132,7 @@ TEST_F(GuardedOperations, OfDelivery) {
 }
 
 TEST_F(GuardedOperations, OfCreationAndQueries) {
-    mapping->_imageFormatsReady = false;
+    mapping->imageFormatsReady_ = false;
     Expect("InternalQueryInterface", [this] { return Query(NMA::IID_IUncompressedImageProvider); });
     host->maker(CompID_LockComponent, [](const GUID&, void**) -> NCFRESULT { throw NCF_E_HANDLE; });
     EXPECT_EQ(mapping->InitializeInstance(host->unknown()), NCF_E_HANDLE);

@@ -29,7 +29,7 @@ void NoConversion(const ncfUInt8*, ncfUInt8*, std::size_t, std::size_t, ncfUInt3
 // A track that can hold an entry without a format.
 class TrackWithAHole final : public MediaTrack {
 public:
-    TrackWithAHole() { _formats.resize(1); }
+    TrackWithAHole() { formats_.resize(1); }
     ncfUInt32 GetTrackType() const override { return kVideo; }
 };
 

@@ -17,7 +17,7 @@ protected:
         journal.clear();
     }
     ncfUInt32 Channels(ncfUInt32 track) {
-        return dynamic_cast<AudioMediaTrack&>(*mapping->_mediaTracks[track])
+        return dynamic_cast<AudioMediaTrack&>(*mapping->mediaTracks_[track])
             .GetNumberAudioChannels();
     }
 };
@@ -78,7 +78,7 @@ TEST_F(AudioFormats, NullOutputOutranksABadTrack) {
 }
 
 TEST_F(AudioFormats, FormatOfAnotherKindIsRefused) {
-    mapping->_mediaTracks[1]->AddFormat(QTImageFormat());
+    mapping->mediaTracks_[1]->AddFormat(QTImageFormat());
     ncfUInt32 format = 77;
     ncfUInt16 bytes = 77;
     ncfUInt16 bits = 77;
@@ -107,10 +107,10 @@ TEST_F(AudioFormats, ChoiceTellsTheReaderAndKeepsItsChannelCount) {
 
 TEST_F(AudioFormats, ChoosesUnderTheLock) {
     std::vector<ncfUInt32> chosen;
-    lock->whenLocked = [&] { chosen.push_back(mapping->_mediaTracks[1]->GetSelectedIndex()); };
+    lock->whenLocked = [&] { chosen.push_back(mapping->mediaTracks_[1]->GetSelectedIndex()); };
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 1), NCF_OK);
     EXPECT_EQ(chosen, std::vector<ncfUInt32>{0}) << "nothing is chosen before the lock";
-    EXPECT_EQ(mapping->_mediaTracks[1]->GetSelectedIndex(), 1u);
+    EXPECT_EQ(mapping->mediaTracks_[1]->GetSelectedIndex(), 1u);
 }
 
 TEST_F(AudioFormats, ReportsAChannelCountThatDiffersFromTheFiles) {
@@ -132,14 +132,14 @@ TEST_F(AudioFormats, ReaderWithoutChannelsIsRefused) {
 
 TEST_F(AudioFormats, ChoicePastTheEndLeavesTheIndexChanged) {
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 5), NCF_E_INVALIDARG);
-    EXPECT_EQ(mapping->_mediaTracks[1]->GetSelectedIndex(), 5u);
-    EXPECT_FALSE(mapping->_mediaTracks[1]->GetSelectedFormat());
+    EXPECT_EQ(mapping->mediaTracks_[1]->GetSelectedIndex(), 5u);
+    EXPECT_FALSE(mapping->mediaTracks_[1]->GetSelectedFormat());
     EXPECT_EQ(log->count(Record("80000003", "track->GetMediaFormat(formatIndex, mediaFormat)",
                                 "SetWorkingAudioFormat")),
               1);
     EXPECT_EQ(journal.startingWith("sound.").size(), 0u);
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 1), NCF_OK);
-    EXPECT_FALSE(mapping->_mediaTracks[1]->GetSelectedFormat()) << "never set for sound";
+    EXPECT_FALSE(mapping->mediaTracks_[1]->GetSelectedFormat()) << "never set for sound";
 }
 
 TEST_F(AudioFormats, ChoiceNeedsASoundTrackBeforeTheLock) {
@@ -155,7 +155,7 @@ TEST_F(AudioFormats, ChoiceNeedsASoundTrackBeforeTheLock) {
 TEST_F(AudioFormats, ChoiceKeepsItsIndexThenMapsItsTrackThenLooksForTheFormat) {
     mapping->_trackRemapVect.assign(1, 3);
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 5), NCF_E_FAIL) << "the map, not the format";
-    EXPECT_EQ(mapping->_mediaTracks[1]->GetSelectedIndex(), 5u);
+    EXPECT_EQ(mapping->mediaTracks_[1]->GetSelectedIndex(), 5u);
 }
 
 TEST_F(AudioFormats, ChoiceGivesTheFailureOfEachStep) {

@@ -287,10 +287,10 @@ TEST_F(Delivery, FormatsThatAreNotDefinedAreAssertedAfterTheRead) {
     Movie({kBGRAPixelFormat});
     QTImageFormat format = Format(0, 0);
     format.pixelFormat = PF_UNDEFINED;
-    mapping->_mediaTracks[0]->AddFormat(format);
+    mapping->mediaTracks_[0]->AddFormat(format);
     format = Format(0, 0);
     format.componentFormat = CT_UNDEFINED;
-    mapping->_mediaTracks[0]->AddFormat(format);
+    mapping->mediaTracks_[0]->AddFormat(format);
     Frame().assign(8, 1);
     Choose(0, 1);
     EXPECT_EQ(Ask(0), NCF_E_FAIL);
@@ -332,14 +332,14 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfAPicture) {
     buffer->givesNull = true;
     EXPECT_EQ(Ask(0), NCF_E_POINTER) << "a buffer without memory";
     buffer->givesNull = false;
-    mapping->_mediaTracks[0]->SetSelectedIndex(8);
+    mapping->mediaTracks_[0]->SetSelectedIndex(8);
     EXPECT_EQ(Ask(0), NCF_E_INVALIDARG);
     EXPECT_EQ(log->count(Record("80000003",
                                 "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
                                 "ProvideSampleRange")),
               1);
-    mapping->_mediaTracks[0]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
-    mapping->_mediaTracks[0]->SetSelectedIndex(1);
+    mapping->mediaTracks_[0]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
+    mapping->mediaTracks_[0]->SetSelectedIndex(1);
     EXPECT_EQ(Ask(0), NCF_E_POINTER);
     EXPECT_EQ(log->count(Check("CHK_PTR(video_format)", "ProvideSampleRange")), 1);
 }
@@ -455,7 +455,7 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfSound) {
     EXPECT_EQ(log->count(Record("80000008", "AAFTrackToQuickTimeTrack(trackNMA, &trackQT)",
                                 "ProvideSampleRange")),
               1);
-    MediaTrack& track = *mapping->_mediaTracks[1];
+    MediaTrack& track = *mapping->mediaTracks_[1];
     track.SetSelectedIndex(2);
     EXPECT_EQ(Ask(1), NCF_E_INVALIDARG);
     EXPECT_EQ(log->count(Record("80000003",
@@ -473,8 +473,8 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfSound) {
 
 TEST_F(Delivery, SoundNeedsATrackThatKeepsAChannelCount) {
     Movie({kBGRAPixelFormat});
-    mapping->_mediaTracks[1].reset(new SoundTrackWithoutChannels);
-    mapping->_mediaTracks[1]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
+    mapping->mediaTracks_[1].reset(new SoundTrackWithoutChannels);
+    mapping->mediaTracks_[1]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
     EXPECT_EQ(Ask(1), NCF_E_POINTER);
     EXPECT_EQ(log->count(Check("CHK_PTR(audio_track)", "ProvideSampleRange")), 1);
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 0), NCF_E_POINTER);
@@ -519,7 +519,7 @@ TEST_F(Delivery, MappingsOfOneClipShareItsReaders) {
     static_cast<INCFUnknown*>(images)->Release();
     ASSERT_EQ(other->SetWorkingImageFormat(0, 1), NCF_OK);
     EXPECT_EQ(journal.count("wrapper.GetQTVideoReader"), 0) << "the clip has it";
-    EXPECT_EQ(mapping->_mediaTracks[0]->GetSelectedIndex(), 0u) << "choices are apart";
+    EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedIndex(), 0u) << "choices are apart";
     Frame().assign(8, 0);
     EXPECT_EQ(Ask(0), NCF_OK);
     EXPECT_EQ(journal.startingWith("reader.Set").back(), "reader.SetOutputPixelFormat BGRA 0 0");

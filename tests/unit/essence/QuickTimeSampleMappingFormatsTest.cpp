@@ -20,8 +20,8 @@ protected:
     }
     NCFRESULT Add(ncfUInt32 fourCC, ncfUInt32 videoRange = 0) {
         MediaTrack* const alpha =
-            mapping->_mediaTracks.size() > 1 ? mapping->_mediaTracks[1].get() : nullptr;
-        return mapping->AddPixelFormat(mapping->_mediaTracks[0].get(), alpha, fourCC, videoRange);
+            mapping->mediaTracks_.size() > 1 ? mapping->mediaTracks_[1].get() : nullptr;
+        return mapping->AddPixelFormat(mapping->mediaTracks_[0].get(), alpha, fourCC, videoRange);
     }
     Lines ConsoleTexts() {
         Lines texts;
@@ -68,7 +68,7 @@ TEST_F(SampleMappingFormats, ThreeCodesAskForBGRA) {
 
 TEST_F(SampleMappingFormats, EachOfTheThreeCodesTakesTheRangeOfTheCodec) {
     for (const ncfUInt32 code : {kBGRAPixelFormat, kRGBAPixelFormat, k32ARGBPixelFormat}) {
-        mapping->_mediaTracks.clear();
+        mapping->mediaTracks_.clear();
         clip->video.clear();
         Movie();
         EXPECT_EQ(Add(code, 2), NCF_OK) << "any flag but 0";
@@ -162,7 +162,7 @@ TEST_F(SampleMappingFormats, YCbCrDoesNotGoWithAlpha) {
 TEST_F(SampleMappingFormats, LevelsOtherThanTheDefaultTakeThePictureThroughBGRA) {
     for (const ncfUInt32 level : {1u, 2u, 0u}) {
         clip->video.clear();
-        mapping->_mediaTracks.clear();
+        mapping->mediaTracks_.clear();
         Movie();
         clip->setLevels(level);
         EXPECT_EQ(Add(k2vuyPixelFormat), NCF_OK);
@@ -186,7 +186,7 @@ TEST_F(SampleMappingFormats, AlphaGoesToAnAlphaTrackOnlyAndThePictureStays) {
     AudioMediaTrack wrong;
     for (const ncfUInt32 code : {kBGRAPixelFormat, kb64aPixelFormat, kr4flPixelFormat}) {
         log->clear();
-        EXPECT_EQ(mapping->AddPixelFormat(mapping->_mediaTracks[0].get(), &wrong, code, 0),
+        EXPECT_EQ(mapping->AddPixelFormat(mapping->mediaTracks_[0].get(), &wrong, code, 0),
                   NCF_E_FAIL);
         EXPECT_EQ(
             log->count(Check("NCFASSERT( MediaTrack::kVideoAlpha == alpha_track->GetTrackType() )",
@@ -195,7 +195,7 @@ TEST_F(SampleMappingFormats, AlphaGoesToAnAlphaTrackOnlyAndThePictureStays) {
     }
     EXPECT_EQ(Offered(0).size(), 3u);
     EXPECT_EQ(wrong.GetNumberOfFormats(), 0u);
-    EXPECT_EQ(mapping->AddPixelFormat(mapping->_mediaTracks[0].get(), &wrong, kNVZ2PixelFormat, 0),
+    EXPECT_EQ(mapping->AddPixelFormat(mapping->mediaTracks_[0].get(), &wrong, kNVZ2PixelFormat, 0),
               NCF_OK)
         << "a row without alpha doesn't look";
 }
@@ -211,7 +211,7 @@ TEST_F(SampleMappingFormats, PictureTrackIsNeeded) {
 TEST_F(SampleMappingFormats, ConsoleIsNeeded) {
     Movie();
     mapping->_pConsole = nullptr;
-    EXPECT_EQ(mapping->AddDecompressorPixelFormats(mapping->_mediaTracks[0].get(), nullptr),
+    EXPECT_EQ(mapping->AddDecompressorPixelFormats(mapping->mediaTracks_[0].get(), nullptr),
               NCF_E_POINTER);
     EXPECT_EQ(log->count(Check("CHK_PTR(_pConsole)", "AddDecompressorPixelFormats")), 1);
 }
@@ -326,7 +326,7 @@ TEST_F(SampleMappingFormats, ColourSpaceGoesBySizeWhereTheClipHasNone) {
                           {959, 1080, CS_YCbCr_601}};
     for (const Case& size : cases) {
         for (const ncfUInt32 told : {CS_UNDEFINED, CS_RGB}) {
-            mapping->_mediaTracks.clear();
+            mapping->mediaTracks_.clear();
             clip->video.clear();
             Movie();
             clip->setSize(size.width, size.height);
@@ -372,10 +372,10 @@ TEST_F(SampleMappingFormats, CodecWithoutFormatsIsAskedForSeveralAllTheSame) {
     clip->results["IsMultiFormatMovie"] = NCF_E_ABORT;
     EXPECT_EQ(QueryImages(), NCF_E_ABORT);
     EXPECT_EQ(Offered(0).size(), 1u);
-    EXPECT_TRUE(mapping->_imageFormatsReady) << "there is a format, whatever failed after it";
+    EXPECT_TRUE(mapping->imageFormatsReady_) << "there is a format, whatever failed after it";
     clip->results.clear();
     host->console().clear();
-    EXPECT_EQ(mapping->AddDecompressorPixelFormats(mapping->_mediaTracks[0].get(), nullptr),
+    EXPECT_EQ(mapping->AddDecompressorPixelFormats(mapping->mediaTracks_[0].get(), nullptr),
               NCF_OK);
     EXPECT_EQ(Offered(0), Lines{"2/1/8/1/1 <- 2vuy"});
     EXPECT_EQ(Console(4, "Adding support for '2vuy'.\n"), 2) << "told, though it is there";
@@ -409,12 +409,12 @@ TEST_F(SampleMappingFormats, AlphaTrackAloneCanBeLeftWithoutFormats) {
     EXPECT_EQ(Offered(0), Lines{"8/4/2/1/1 <- NVZ2"});
     EXPECT_EQ(Console(2, "No one image pixel format was added for video track.\n"), 0);
     EXPECT_EQ(Console(2, "No one image pixel format was added for alpha track.\n"), 1);
-    EXPECT_TRUE(mapping->_imageFormatsReady) << "the picture decides";
+    EXPECT_TRUE(mapping->imageFormatsReady_) << "the picture decides";
 }
 
 TEST_F(SampleMappingFormats, AlphaThatIsIgnoredIsNoAlpha) {
     Movie();
-    mapping->_mediaTracks.emplace_back(new VideoMediaTrack(MediaTrack::kVideoAlpha));
+    mapping->mediaTracks_.emplace_back(new VideoMediaTrack(MediaTrack::kVideoAlpha));
     clip->setAlpha(true);
     clip->setIgnoreAlpha(true);
     property->storageType = 1;
@@ -518,11 +518,11 @@ TEST_F(SampleMappingFormats, GivesTheFailureOfTheQuestionForSeveralFormats) {
 
 TEST_F(SampleMappingFormats, CopiesTheLevelWhenItLooksForFormats) {
     Movie();
-    EXPECT_EQ(mapping->_levelRemap, static_cast<ncfUInt32>(Default_Levels));
+    EXPECT_EQ(mapping->levelRemap_, static_cast<ncfUInt32>(Default_Levels));
     clip->setLevels(Compress_Levels);
-    EXPECT_EQ(mapping->_levelRemap, static_cast<ncfUInt32>(Default_Levels));
+    EXPECT_EQ(mapping->levelRemap_, static_cast<ncfUInt32>(Default_Levels));
     EXPECT_EQ(QueryImages(), NCF_OK);
-    EXPECT_EQ(mapping->_levelRemap, static_cast<ncfUInt32>(Compress_Levels));
+    EXPECT_EQ(mapping->levelRemap_, static_cast<ncfUInt32>(Compress_Levels));
 }
 
 // --- asking the property component --------------------------------------------------------------
@@ -579,7 +579,7 @@ TEST_F(SampleMappingFormats, CodecThatCannotTellItsFormatsHasNone) {
     property->results["GetCodecPixelFormats"] = NCF_E_FAIL;
     EXPECT_EQ(QueryImages(), NCF_OK);
     EXPECT_EQ(Offered(0), Lines{"2/1/8/1/1 <- 2vuy"});
-    EXPECT_TRUE(mapping->_codecPixelFormats.empty());
+    EXPECT_TRUE(mapping->codecPixelFormats_.empty());
     EXPECT_TRUE(log->records().empty()) << "no failure, no record";
 }
 

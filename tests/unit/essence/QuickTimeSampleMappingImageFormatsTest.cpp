@@ -102,7 +102,7 @@ TEST_F(ImageFormats, FormatPastTheEndOrOfAnotherKindIsRefused) {
     EXPECT_EQ(Get(0, 1), NCF_E_INVALIDARG);
     EXPECT_EQ(log->count(Record("80000003", badFormat, "GetImageFormat")), 1);
     EXPECT_EQ(Get(1, 0), NCF_E_INVALIDARG) << "a sound track";
-    mapping->_mediaTracks[0]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
+    mapping->mediaTracks_[0]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
     EXPECT_EQ(Get(0, 1), NCF_E_POINTER);
     EXPECT_EQ(log->count(Check("CHK_PTR(image_format)", "GetImageFormat")), 1);
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_E_POINTER);
@@ -121,20 +121,20 @@ TEST_F(ImageFormats, FirstChoiceBringsTheReaderUnderTheLock) {
     EXPECT_EQ(end, (Lines{"wrapper.GetQTVideoReader", "reader.SetOutputPixelFormat BGRA 0 0",
                           "reader.InitQT", "unlock"}));
     EXPECT_EQ(journal.count("reader.ReleaseQT"), 0);
-    EXPECT_EQ(mapping->_mediaTracks[0]->GetSelectedIndex(), 0u);
-    EXPECT_TRUE(mapping->_mediaTracks[0]->GetSelectedFormat());
+    EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedIndex(), 0u);
+    EXPECT_TRUE(mapping->mediaTracks_[0]->GetSelectedFormat());
 }
 
 TEST_F(ImageFormats, ChoosesUnderTheLock) {
     Movie({kBGRAPixelFormat, kb64aPixelFormat});
     std::vector<ncfUInt32> chosen;
     lock->whenLocked = [&] {
-        const MediaTrack& track = *mapping->_mediaTracks[0];
+        const MediaTrack& track = *mapping->mediaTracks_[0];
         chosen.push_back(track.GetSelectedFormat() ? 77 : track.GetSelectedIndex());
     };
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_OK);
     EXPECT_EQ(chosen, std::vector<ncfUInt32>{0}) << "nothing is chosen before the lock";
-    EXPECT_EQ(mapping->_mediaTracks[0]->GetSelectedIndex(), 1u);
+    EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedIndex(), 1u);
 }
 
 TEST_F(ImageFormats, SameChoiceAgainChangesAndTellsNothing) {
@@ -181,7 +181,7 @@ TEST_F(ImageFormats, LabelsFollowTheReadersCode) {
         QTImageFormat format;
         format.fieldOrder = 1;
         format.qt_params.fourCC = row.code;
-        MediaTrack& track = *mapping->_mediaTracks[0];
+        MediaTrack& track = *mapping->mediaTracks_[0];
         track.AddFormat(format);
         host->console().clear();
         EXPECT_EQ(mapping->SetWorkingImageFormat(0, track.GetNumberOfFormats() - 1), NCF_OK);
@@ -203,12 +203,12 @@ TEST_F(ImageFormats, TenBitRowOfTheTablePrintsItsRecipe) {
 TEST_F(ImageFormats, ChoicePastTheEndLeavesSelectionAndReader) {
     Movie({kBGRAPixelFormat, kb64aPixelFormat});
     ASSERT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_OK);
-    const MediaFormatPtr selected = mapping->_mediaTracks[0]->GetSelectedFormat();
+    const MediaFormatPtr selected = mapping->mediaTracks_[0]->GetSelectedFormat();
     journal.clear();
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 2), NCF_E_INVALIDARG);
     EXPECT_EQ(journal.lines(), (Lines{"lock", "unlock"}));
-    EXPECT_EQ(mapping->_mediaTracks[0]->GetSelectedIndex(), 1u);
-    EXPECT_EQ(mapping->_mediaTracks[0]->GetSelectedFormat(), selected);
+    EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedIndex(), 1u);
+    EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedFormat(), selected);
     EXPECT_EQ(log->count(Record("80000003", badFormat, "SetWorkingImageFormat")), 1);
 }
 
@@ -225,8 +225,8 @@ TEST_F(ImageFormats, FailureToStartLeavesTheSelectionChangedAndSaysSo) {
     Movie({kBGRAPixelFormat, kb64aPixelFormat});
     wrapper->picture->results["InitQT"] = NCF_E_HANDLE;
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_E_HANDLE);
-    EXPECT_EQ(mapping->_mediaTracks[0]->GetSelectedIndex(), 1u);
-    EXPECT_TRUE(mapping->_mediaTracks[0]->GetSelectedFormat());
+    EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedIndex(), 1u);
+    EXPECT_TRUE(mapping->mediaTracks_[0]->GetSelectedFormat());
     EXPECT_EQ(log->count(Record("80000006",
                                 "_videoReaderHolder->InitQT( QTWrapper::kUseDecompressionSession)",
                                 "SetWorkingImageFormat")),

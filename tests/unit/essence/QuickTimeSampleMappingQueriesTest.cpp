@@ -85,7 +85,7 @@ TEST_F(SampleQueries, ChannelsNeedTheWrapper) {
 // the map.
 TEST_F(SampleQueries, ChannelsBehindASecondPictureFollowTheListAndNotTheMap) {
     AddVideo(9);
-    mapping->_mediaTracks.clear();
+    mapping->mediaTracks_.clear();
     mapping->_trackRemapVect.clear();
     Bind();
     ncfUInt32 channels = 9;

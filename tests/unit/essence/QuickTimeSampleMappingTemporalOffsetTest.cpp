@@ -11,7 +11,7 @@ class TemporalOffset : public MappingFixture {
 protected:
     void Samples(std::vector<ncfSInt64> offsets, ncfSInt64 duration = 1000) {
         clip->video.clear();
-        mapping->_mediaTracks.clear();
+        mapping->mediaTracks_.clear();
         AddVideo(7, std::move(offsets)).duration = duration;
         Bind();
     }

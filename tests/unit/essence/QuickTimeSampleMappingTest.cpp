@@ -4,6 +4,7 @@
 #include "host_interfaces/header_parser/QTParser.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/parameters/ParametersXML.h"
+#include "source/parameters/QTParameters.h"
 #include "tests/unit/aaf/support/StubbornString.h"
 #include "tests/unit/essence/support/MappingFixture.h"
 
@@ -18,8 +19,8 @@ TEST_F(SampleMapping, TakesFactoryLockAndConsoleFromTheHostInThisOrder) {
     FakeLock* const ours = lock;
     const auto create = [&](INCFUnknown* unknown) {
         out = nullptr;
-        return NMA::Impl::CreateQuickTimeSampleMapping(unknown, nullptr, NMA::IID_ISampleMapping,
-                                                       &out);
+        return CreateInstanceOf<NMA::Impl::QuickTimeSampleMapping>(unknown, nullptr,
+                                                                   NMA::IID_ISampleMapping, &out);
     };
     EXPECT_EQ(create(nullptr), NCF_E_POINTER);
     host->refuseQuery(IID_INCFConsole, NCF_E_HANDLE);
@@ -35,8 +36,8 @@ TEST_F(SampleMapping, TakesFactoryLockAndConsoleFromTheHostInThisOrder) {
 TEST_F(SampleMapping, HasALockOfItsOwn) {
     void* out = nullptr;
     FakeLock* const first = lock;
-    ASSERT_EQ(NMA::Impl::CreateQuickTimeSampleMapping(host->unknown(), nullptr,
-                                                      NMA::IID_ISampleMapping, &out),
+    ASSERT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeSampleMapping>(host->unknown(), nullptr,
+                                                                  NMA::IID_ISampleMapping, &out),
               NCF_OK);
     EXPECT_NE(lock, first);
     static_cast<NMA::ISampleMapping*>(out)->Release();
@@ -98,7 +99,7 @@ TEST_F(SampleMapping, GivesNewParametersOfItsClipForEachQuery) {
     AddVideo(1);
     Bind();
     host->maker(NMA::CompID_QTParameters, [this](const GUID& iid, void** out) {
-        return NMA::Impl::CreateQTParameters(host->unknown(), nullptr, iid, out);
+        return CreateInstanceOf<NMA::Impl::QTParameters>(host->unknown(), nullptr, iid, out);
     });
     INCFParametersXML* answers[2] = {};
     for (INCFParametersXML*& answer : answers) {
@@ -170,7 +171,7 @@ TEST_F(SampleMapping, LooksForPictureFormatsAtTheFirstImageQueryUnderTheLock) {
     ASSERT_GE(journal.lines().size(), 2u);
     EXPECT_EQ(journal.lines().front(), "lock");
     EXPECT_EQ(journal.lines().back(), "unlock");
-    EXPECT_TRUE(mapping->_imageFormatsReady);
+    EXPECT_TRUE(mapping->imageFormatsReady_);
     EXPECT_EQ(property->path, "/movies/a.mov");
     journal.clear();
     EXPECT_EQ(QueryImages(), NCF_OK);
@@ -182,7 +183,7 @@ TEST_F(SampleMapping, LooksAgainAtEachImageQueryWhileNoFormatCouldBeAdded) {
     clip->setAlpha(true);
     Bind();
     EXPECT_EQ(QueryImages(), NCF_E_FAIL);
-    EXPECT_FALSE(mapping->_imageFormatsReady);
+    EXPECT_FALSE(mapping->imageFormatsReady_);
     EXPECT_EQ(QueryImages(), NCF_E_FAIL);
     EXPECT_EQ(journal.count("property.GetCodecStorageType"), 2);
 }
@@ -290,8 +291,8 @@ TEST_F(SampleMapping, FailedAudioQueryGivesTheCodeAndAReferenceToRelease) {
 TEST_F(SampleMapping, CreationThatAsksForAProviderGivesItsFailureWithAReference) {
     void* out = nullptr;
     FakeLock* const first = lock;
-    EXPECT_EQ(NMA::Impl::CreateQuickTimeSampleMapping(host->unknown(), nullptr,
-                                                      NMA::IID_IUncompressedAudioProvider, &out),
+    EXPECT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeSampleMapping>(
+                  host->unknown(), nullptr, NMA::IID_IUncompressedAudioProvider, &out),
               NCF_E_INVALIDARG);
     ASSERT_NE(out, nullptr);
     static_cast<INCFUnknown*>(out)->Release();
@@ -325,13 +326,13 @@ TEST_F(SampleMapping, TakesAClipThatCannotTellItsTracks) {
     AddAudio(2);
     clip->results["GetAudioTrackCount"] = NCF_E_FAIL;
     EXPECT_EQ(mapping->SetMediaContainer(clip), NCF_OK);
-    EXPECT_EQ(mapping->_mediaTracks.size(), 1u) << "what it told up to there";
+    EXPECT_EQ(mapping->mediaTracks_.size(), 1u) << "what it told up to there";
     EXPECT_EQ(log->count(Record("80000008", "media->GetAudioTrackCount(&audioTrackCount)",
                                 "InitializeMediaTracks")),
               1);
     clip->results["GetVideoTrackCount"] = NCF_E_HANDLE;
     EXPECT_EQ(mapping->SetMediaContainer(clip), NCF_OK);
-    EXPECT_EQ(mapping->_mediaTracks.size(), 1u);
+    EXPECT_EQ(mapping->mediaTracks_.size(), 1u);
 }
 
 // --- Setup and Cleanup -------------------------------------------------------------------------
@@ -448,7 +449,7 @@ TEST_F(SampleMapping, RefreshAddsFormatsThenLetsTheClipWorkOutItsFieldsUnderTheL
     EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_OK);
     EXPECT_EQ(Offered(0), (Lines{"2/1/8/1/1 <- 2vuy", "8/4/2/1/1 <- NVZ2"}))
         << "the new format comes behind, the old one stays";
-    EXPECT_EQ(mapping->_levelRemap, static_cast<ncfUInt32>(Expand_Levels));
+    EXPECT_EQ(mapping->levelRemap_, static_cast<ncfUInt32>(Expand_Levels));
     EXPECT_EQ(journal.count("property.CreateMovie"), 0) << "the codec is known";
     EXPECT_EQ(journal.lines().front(), "lock");
     ASSERT_GE(journal.lines().size(), 2u);
@@ -507,7 +508,7 @@ TEST_F(SampleMapping, RefreshBeforeTheFirstLookLooksAndIgnoresItsFailure) {
     EXPECT_EQ(journal.count("clip.SetFieldLayoutDetails"), 1);
     property->results.clear();
     EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_OK);
-    EXPECT_TRUE(mapping->_imageFormatsReady);
+    EXPECT_TRUE(mapping->imageFormatsReady_);
 }
 
 TEST_F(SampleMapping, RefreshGivesTheFailureOfTheFields) {

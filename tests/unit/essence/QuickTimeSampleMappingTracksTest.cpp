@@ -10,7 +10,7 @@ class SampleMappingTracks : public MappingFixture {
 protected:
     std::vector<ncfUInt32> Types() {
         std::vector<ncfUInt32> types;
-        for (const auto& track : mapping->_mediaTracks) {
+        for (const auto& track : mapping->mediaTracks_) {
             types.push_back(track->GetTrackType());
         }
         return types;
@@ -169,7 +169,7 @@ TEST_F(SampleMappingTracks, TrackPastTheEndIsSilentlyInvalid) {
 }
 
 TEST_F(SampleMappingTracks, EmptySlotIsAsserted) {
-    mapping->_mediaTracks.resize(1);
+    mapping->mediaTracks_.resize(1);
     std::tr1::shared_ptr<MediaTrack> track;
     EXPECT_EQ(mapping->GetMediaTrack(0, track), NCF_E_FAIL);
     EXPECT_EQ(log->count(Check("NCFASSERT( mediaTrack.get() )", "GetMediaTrack")), 1);
@@ -179,7 +179,7 @@ TEST_F(SampleMappingTracks, EmptySlotIsAsserted) {
 TEST_F(SampleMappingTracks, SoundHasTwoFormatsLittleEndianFirst) {
     AddAudio(1);
     Bind();
-    const auto& formats = mapping->_mediaTracks.at(0)->GetFormats();
+    const auto& formats = mapping->mediaTracks_.at(0)->GetFormats();
     ASSERT_EQ(formats.size(), 2u);
     EXPECT_TRUE(dynamic_cast<const QTAudioFormat&>(*formats[0]) ==
                 QTAudioFormat(0x4132434C, 3, 24));
@@ -192,8 +192,8 @@ TEST_F(SampleMappingTracks, FindersGiveTheFirstOfAKind) {
     AddVideo(2);
     clip->setAlpha(true);
     Bind();
-    EXPECT_EQ(mapping->FirstTrackOf(MediaTrack::kVideo), mapping->_mediaTracks[0].get());
-    EXPECT_EQ(mapping->FirstTrackOf(MediaTrack::kVideoAlpha), mapping->_mediaTracks[2].get());
+    EXPECT_EQ(mapping->FirstTrackOf(MediaTrack::kVideo), mapping->mediaTracks_[0].get());
+    EXPECT_EQ(mapping->FirstTrackOf(MediaTrack::kVideoAlpha), mapping->mediaTracks_[2].get());
     EXPECT_EQ(mapping->FirstTrackOf(MediaTrack::kAudio), nullptr);
 }
 

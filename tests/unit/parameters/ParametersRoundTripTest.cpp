@@ -11,7 +11,8 @@
 #include "reference_host/parameters/ParameterSuite.h"
 #include "reference_host/parameters/ParameterValue.h"
 #include "reference_host/parameters/ParametersReader.h"
-#include "source/parameters/NMAParametersVisitor.h"
+#include "source/parameters/QTParameters.h"
+#include "source/parameters/model/NMAParametersVisitor.h"
 #include "tests/support/fakes/HostXml.h"
 #include "tests/unit/essence/support/MappingFixture.h"
 
@@ -31,7 +32,7 @@ protected:
               [] { return host::MakeRef<host::ParametersReader>(host::Ref<INCFConsole>()); });
         serve(kValueTypeUInt32, [] { return host::MakeRef<host::ValueFactory>(); });
         host->maker(NMA::CompID_QTParameters, [this](const GUID& iid, void** out) {
-            return NMA::Impl::CreateQTParameters(host->unknown(), nullptr, iid, out);
+            return CreateInstanceOf<NMA::Impl::QTParameters>(host->unknown(), nullptr, iid, out);
         });
         AddVideo(1);
         record() = {512, 16, 2, 512};
@@ -200,7 +201,7 @@ TEST_F(ParametersRoundTrip, AWriteReachesTheClipAndTheMapping) {
     EXPECT_EQ(visitor->SetUInt32(kComponent, 0, kParamSetDefault, kParamLevelRemapping, 1), NCF_OK);
     EXPECT_EQ(journal.count("lock"), 1) << "one refresh";
     EXPECT_EQ(record().levelRemap, 1u);
-    EXPECT_EQ(mapping->_levelRemap, 1u) << "the mapping followed";
+    EXPECT_EQ(mapping->levelRemap_, 1u) << "the mapping followed";
     EXPECT_EQ(record().fieldOrderInFile, 512u);
     EXPECT_EQ(record().fieldLayout, 2u);
     EXPECT_EQ(read(kParamLevelRemapping), 1u);

@@ -29,7 +29,7 @@ TEST_F(QTParametersEvents, TakeTheThreeValuesOfTheSetInUse) {
     EXPECT_EQ(Record().fieldLayout, 3u);
     EXPECT_EQ(Record().levelRemap, 2u);
     EXPECT_EQ(Record().detectedFieldOrder, 8192u) << "no document says what was detected";
-    EXPECT_EQ(mapping->_levelRemap, 2u) << "the mapping follows";
+    EXPECT_EQ(mapping->levelRemap_, 2u) << "the mapping follows";
 }
 
 TEST_F(QTParametersEvents, TakeNumbersThatAreNoChoices) {

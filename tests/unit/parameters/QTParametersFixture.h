@@ -31,7 +31,7 @@ protected:
         host->name(NCFCompID_NCFString, "string");
         host->name(NMA::CompID_QTParameters, "parameters");
         host->maker(NMA::CompID_QTParameters, [this](const GUID& iid, void** out) {
-            return NMA::Impl::CreateQTParameters(host->unknown(), nullptr, iid, out);
+            return CreateInstanceOf<NMA::Impl::QTParameters>(host->unknown(), nullptr, iid, out);
         });
         xml.attach(MakeHostString("unchanged"));
     }
@@ -56,9 +56,9 @@ protected:
     // Parameters that belong to nothing.
     void MakeUnattached() {
         void* out = nullptr;
-        ASSERT_EQ(
-            NMA::Impl::CreateQTParameters(host->unknown(), nullptr, IID_INCFParametersXML, &out),
-            NCF_OK);
+        ASSERT_EQ(CreateInstanceOf<NMA::Impl::QTParameters>(host->unknown(), nullptr,
+                                                            IID_INCFParametersXML, &out),
+                  NCF_OK);
         Take(out);
         journal.clear();
     }

@@ -13,7 +13,8 @@ using QTParametersObject = QTParametersFixture;
 TEST_F(QTParametersObject, TakesTheFactoryFromTheHostThenMakesAString) {
     void* out = this;
     const auto create = [&](INCFUnknown* unknown) {
-        return NMA::Impl::CreateQTParameters(unknown, nullptr, IID_INCFParametersXML, &out);
+        return CreateInstanceOf<NMA::Impl::QTParameters>(unknown, nullptr, IID_INCFParametersXML,
+                                                         &out);
     };
     EXPECT_EQ(create(nullptr), NCF_E_POINTER);
     EXPECT_EQ(out, nullptr);

@@ -89,8 +89,8 @@ QuickTimeToAAFInfoRetriever* QuickTimeToAAFInfoRetriever::GetInstance() {
 }
 
 // Never reached without a retriever.
-NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const BaseClip*, AAFInfo*,
-                                                                   ncfUInt32*) {
+NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const DescribedPicture*,
+                                                                   AAFInfo*, ncfUInt32*) {
     return NCF_E_UNEXPECTED;
 }
 bool QuickTimeToAAFInfoRetriever::IsMPEGDescriptor() const {

@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-#include "source/clips/BaseClip.h"
+#include "source/clips/ClipPicture.h"
 #include "source/descriptor_data/AAFInfo.h"
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "tests/support/fakes/FakeHost.h"
@@ -66,11 +66,11 @@ public:
     // What SetEditRate was given.
     EditorSettings seenSettings;
 
-    ColorDetails& color() { return colorDetails_; }
-    GeometryDetails& geometry() { return geometryDetails_; }
+    ColorDetails& color() { return picture_.color; }
+    GeometryDetails& geometry() { return picture_.geometry; }
     void setAlpha(bool inFile, bool ignored) {
-        hasAlpha_ = inFile;
-        ignoreAlpha_ = ignored;
+        picture_.hasAlpha = inFile;
+        picture_.ignoreAlpha = ignored;
     }
     void setTiming() {
         editRate_ = rate;
@@ -136,9 +136,7 @@ public:
             return result;
         }
         if (askRetriever) {
-            ncfUInt32 id = 0;
-            return QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
-                       this, out, &id) == NCF_OK;
+            return rule_.IsInDataFiles(ClipPicture(*this), out);
         }
         if (nativePicture == 1 || halfReadRecord) {
             *out = record;
@@ -164,10 +162,10 @@ public:
         return assign("GetImageAspectRatio", denominator, aspectDenominator);
     }
     NCFRESULT GetColorDetails(ColorDetails* out) const override {
-        return answer("GetColorDetails", out, colorDetails_);
+        return answer("GetColorDetails", out, picture_.color);
     }
     NCFRESULT GetGeometryDetails(GeometryDetails* out) const override {
-        return answer("GetGeometryDetails", out, geometryDetails_);
+        return answer("GetGeometryDetails", out, picture_.geometry);
     }
     NCFRESULT SetEditRateImpl(const EditorSettings& settings) override {
         seenSettings = settings;

@@ -24,7 +24,7 @@ protected:
         EXPECT_EQ(log->count("OtherClip::IsVideoSampleProviderMedia" + reason), 1) << reason;
         EXPECT_EQ(Console(2, line), 1) << line;
         EXPECT_EQ(host->console().lines().size(), 1u) << reason;
-        EXPECT_EQ(retriever.asked, nullptr) << reason;
+        EXPECT_FALSE(retriever.asked) << reason;
     }
 
     AAFInfo info;
@@ -41,7 +41,11 @@ const char kIssues[] =
 
 TEST_F(OtherClipPolicy, IsNativeWhenTheRetrieverKnowsThePicture) {
     EXPECT_EQ(other->IsVideoSampleProviderMedia(&info), 1);
-    EXPECT_EQ(retriever.asked, other.get());
+    ncfUInt32 width = 0;
+    ncfUInt32 height = 0;
+    ASSERT_EQ(other->GetEncodedWidthAndHeight(&width, &height), NCF_OK);
+    EXPECT_TRUE(retriever.asked);
+    EXPECT_EQ(retriever.width, width);
     EXPECT_EQ(retriever.record, &info);
     EXPECT_EQ(wrapper->issueArguments, "25/1 250");
     EXPECT_TRUE(host->console().lines().empty());

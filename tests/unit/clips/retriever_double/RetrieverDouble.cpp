@@ -15,10 +15,12 @@ QuickTimeToAAFInfoRetriever* QuickTimeToAAFInfoRetriever::GetInstance() {
     return retriever.exists ? reinterpret_cast<QuickTimeToAAFInfoRetriever*>(place) : nullptr;
 }
 
-NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const BaseClip* media,
+NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const DescribedPicture* media,
                                                                    AAFInfo* aafInfo,
                                                                    ncfUInt32* vcid) {
-    retriever.asked = media;
+    retriever.asked = true;
+    ncfUInt32 height = 0;
+    (void)media->GetEncodedWidthAndHeight(&retriever.width, &height);
     retriever.record = aafInfo;
     *vcid = 4711;
     return retriever.result;

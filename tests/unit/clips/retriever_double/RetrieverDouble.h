@@ -8,7 +8,8 @@
 struct RetrieverDouble {
     bool exists = true;
     NCFRESULT result = NCF_OK;
-    const BaseClip* asked = nullptr;
+    bool asked = false;
+    ncfUInt32 width = 0;  // of the picture that was asked about
     AAFInfo* record = nullptr;
 };
 extern RetrieverDouble retriever;

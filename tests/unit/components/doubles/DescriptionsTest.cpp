@@ -6,6 +6,8 @@
 
 #include "host_interfaces/aaf/AAFFile.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "source/components/QuickTimeContainer.h"
+#include "source/components/QuickTimeMediaVolume.h"
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/support/movies/Movie.h"
 #include "tests/unit/aaf/support/FakeAAF.h"
@@ -43,7 +45,8 @@ protected:
         return file->Release();
     }
     NCFSmartPtr<NMA::IMediaContainer3> container(const std::string& name = "a.mov") {
-        const auto object = make<NMA::IMediaContainer3>(NMA::Impl::CreateQuickTimeContainer);
+        const auto object =
+            make<NMA::IMediaContainer3>(CreateInstanceOf<NMA::Impl::QuickTimeContainer>);
         EXPECT_EQ(object->SetFilePath(path(folder / name).inArg()), NCF_OK);
         return object;
     }
@@ -51,7 +54,8 @@ protected:
         volumeDouble.names = {"a.mov"};
         NCFSmartPtr<NMA::IMediaFormat> format;
         NCFSmartPtr<NMA::IAAFClips> clips;
-        const auto volume = make<NMA::IMediaVolume>(NMA::Impl::CreateQuickTimeMediaVolume);
+        const auto volume =
+            make<NMA::IMediaVolume>(CreateInstanceOf<NMA::Impl::QuickTimeMediaVolume>);
         EXPECT_EQ(volume->GetMediaFormat(path(folder).inArg(), format.outArg()), NCF_OK);
         EXPECT_EQ(format->GetAAFClips(clips.outArg()), NCF_OK);
         return clips;
@@ -161,8 +165,8 @@ TEST_F(Descriptions, OfAContainerNeedALoadedClip) {
 TEST_F(Descriptions, OfAContainerWithoutTheInterfaceGiveTheRefusal) {
     auto* const outer = new FakeLock;
     INCFUnknown* inner = nullptr;
-    ASSERT_EQ(NMA::Impl::CreateQuickTimeContainer(host.unknown(), outer, IID_INCFUnknown,
-                                                  reinterpret_cast<void**>(&inner)),
+    ASSERT_EQ(CreateInstanceOf<NMA::Impl::QuickTimeContainer>(
+                  host.unknown(), outer, IID_INCFUnknown, reinterpret_cast<void**>(&inner)),
               NCF_OK);
     {
         NCFSmartPtr<NMA::IMediaContainer3> object;

@@ -3,6 +3,8 @@
 
 // What the components make of the answers of a volume.
 
+#include "source/components/QuickTimeMediaFormat.h"
+#include "source/components/QuickTimeMediaVolume.h"
 #include "tests/unit/components/ComponentFixture.h"
 #include "tests/unit/components/doubles/Doubles.h"
 
@@ -26,7 +28,7 @@ protected:
     }
 
     NCFSmartPtr<NMA::IMediaVolume> volume =
-        make<NMA::IMediaVolume>(NMA::Impl::CreateQuickTimeMediaVolume);
+        make<NMA::IMediaVolume>(CreateInstanceOf<NMA::Impl::QuickTimeMediaVolume>);
 };
 
 TEST_F(Scans, LookForMoviesAlone) {
@@ -42,7 +44,7 @@ TEST_F(Scans, LookForMoviesAlone) {
 }
 
 TEST_F(Scans, GoOverTheEmptyPathWhereNoneWasSet) {
-    const auto format = make<NMA::IMediaFormat>(NMA::Impl::CreateQuickTimeMediaFormat);
+    const auto format = make<NMA::IMediaFormat>(CreateInstanceOf<NMA::Impl::QuickTimeMediaFormat>);
     NCFSmartPtr<NMA::IAAFClips> clips;
     ASSERT_EQ(format->GetAAFClips(clips.outArg()), NCF_OK);
     EXPECT_EQ(volumeDouble.paths, std::vector<std::string>{""});

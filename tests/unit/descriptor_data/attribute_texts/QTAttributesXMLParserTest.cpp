@@ -12,7 +12,6 @@
 namespace {
 
 using ParseHelperFunctions::QTAttributesXMLParser;
-using ParseHelperFunctions::StringToGUID;
 
 constexpr char kColour[] =
     "<ColorSpaceDescriptor><Name>Log C</Name><BitDepth>12</BitDepth>"
@@ -153,39 +152,6 @@ TEST_F(AttributeTexts, MalformedTransferLabelLeavesTheFieldAsItWas) {
                        colour),
               NCF_OK);
     EXPECT_TRUE(colour.transferCharacteristicUID == before);
-}
-
-TEST_F(AttributeTexts, LabelIsReadInEitherCase) {
-    GUID id{};
-    EXPECT_TRUE(StringToGUID(NMAString("0E170000-0001-0101-060E-2B340401010C"), &id));
-    EXPECT_TRUE(id == ncfGuid("0E170000-0001-0101-060E-2B340401010C"));
-    EXPECT_TRUE(StringToGUID(NMAString("abcdef01-2345-6789-abcd-ef0123456789"), &id));
-    EXPECT_TRUE(id == ncfGuid("ABCDEF01-2345-6789-ABCD-EF0123456789"));
-    EXPECT_FALSE(StringToGUID(NMAString("0E170000-0001-0101-060E"), &id));
-    EXPECT_FALSE(StringToGUID(NMAString("0E170000-0001-0101-060E-2B3404010"), &id))
-        << "ten numbers";
-    EXPECT_TRUE(id == ncfGuid("ABCDEF01-2345-6789-ABCD-EF0123456789"));
-    EXPECT_FALSE(StringToGUID(NMAString(""), &id));
-}
-
-TEST_F(AttributeTexts, NumbersOfALabelMayBeginAsScannedNumbersDo) {
-    struct {
-        const char* text;
-        GUID label;
-    } const kLabels[] = {
-        {" \n0E170000-0001-0101-060E-2B340401010C",
-         ncfGuid("0E170000-0001-0101-060E-2B340401010C")},
-        {"0x170000-0001-0101-060E-2B340401010C", ncfGuid("00170000-0001-0101-060E-2B340401010C")},
-        {"+E170000- 1-0X1-060E-2B340401010C", ncfGuid("0E170000-0001-0001-060E-2B340401010C")},
-        {"0E170000--1-0101-060E-2B340401010C", ncfGuid("0E170000-FFFF-0101-060E-2B340401010C")},
-        {"E17-1-101-060E-2B340401010Cxyz", ncfGuid("00000E17-0001-0101-060E-2B340401010C")},
-    };
-    for (const auto& [text, label] : kLabels) {
-        GUID id{};
-        EXPECT_FALSE(StringToGUID(NMAString("0E170000-0001"), &id));
-        EXPECT_TRUE(StringToGUID(NMAString(text), &id)) << text;
-        EXPECT_TRUE(id == label) << text;
-    }
 }
 
 TEST_F(AttributeTexts, MalformedTextFailsToLoad) {

@@ -32,12 +32,12 @@ public:
                    NCFSmartPtr<INCFComponentFactory>(host.factory())),
           FakeCalls("clip", lines) {
         loaded_ = 1;
-        width_ = 1920;
-        height_ = 1080;
-        temporalFieldOrder_ = kProgressive;
-        frameBufferLayout_ = kLayoutMerged;
-        colorSpace_ = CS_YCbCr_709;
-        ignoreAlpha_ = 0;
+        picture_.width = 1920;
+        picture_.height = 1080;
+        picture_.fields.order = kProgressive;
+        picture_.fields.layout = kLayoutMerged;
+        picture_.colorSpace = CS_YCbCr_709;
+        picture_.ignoreAlpha = 0;
     }
 
     std::vector<EssenceTrack> video;
@@ -49,16 +49,16 @@ public:
     ncfBool multiFormat = 0;
     AudioTrackMetadata metadata = {2, 48000.0, kFormatLPCM, 4, 16, 0, 1};
 
-    void setAlpha(bool alpha) { hasAlpha_ = alpha; }
-    void setIgnoreAlpha(bool ignore) { ignoreAlpha_ = ignore; }
+    void setAlpha(bool alpha) { picture_.hasAlpha = alpha; }
+    void setIgnoreAlpha(bool ignore) { picture_.ignoreAlpha = ignore; }
     void setSize(ncfUInt32 width, ncfUInt32 height) {
-        width_ = width;
-        height_ = height;
+        picture_.width = width;
+        picture_.height = height;
     }
-    void setColorSpace(ncfUInt32 space) { colorSpace_ = space; }
-    void setFieldOrder(ncfUInt32 order) { temporalFieldOrder_ = order; }
-    void setLayout(ncfUInt32 layout) { frameBufferLayout_ = layout; }
-    void setOrientation(ncfUInt32 orientation) { bufferLineOrientation_ = orientation; }
+    void setColorSpace(ncfUInt32 space) { picture_.colorSpace = space; }
+    void setFieldOrder(ncfUInt32 order) { picture_.fields.order = order; }
+    void setLayout(ncfUInt32 layout) { picture_.fields.layout = layout; }
+    void setOrientation(ncfUInt32 orientation) { picture_.fields.lineOrientation = orientation; }
     void setLevels(ncfUInt32 levels) { clipParams_.levelRemap = levels; }
 
     NCFRESULT SetFieldLayoutDetails() override { return enter("SetFieldLayoutDetails"); }
@@ -92,9 +92,9 @@ public:
         return give("GetAudioTrackCount", out, audio.size());
     }
     NCFRESULT GetEncodedWidthAndHeight(ncfUInt32* width, ncfUInt32* height) override {
-        const NCFRESULT result = give("GetEncodedWidthAndHeight", width, width_);
+        const NCFRESULT result = give("GetEncodedWidthAndHeight", width, picture_.width);
         if (result >= 0) {
-            *height = height_;
+            *height = picture_.height;
         }
         return result;
     }

@@ -8,7 +8,6 @@
 
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/CreationFunctions.h"
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/support/fakes/RecordingLogger.h"
 #include "tests/unit/essence/support/EssenceClip.h"
@@ -17,18 +16,18 @@
 // The mapping with its inner steps and fields open.
 class OpenMapping final : public NMA::Impl::QuickTimeSampleMapping {
 public:
-    using QuickTimeSampleMapping::_codecPixelFormats;
-    using QuickTimeSampleMapping::_imageFormatsReady;
-    using QuickTimeSampleMapping::_levelRemap;
-    using QuickTimeSampleMapping::_mediaTracks;
     using QuickTimeSampleMapping::_pConsole;
     using QuickTimeSampleMapping::_trackRemapVect;
     using QuickTimeSampleMapping::AddDecompressorPixelFormats;
     using QuickTimeSampleMapping::AddPixelFormat;
+    using QuickTimeSampleMapping::codecPixelFormats_;
     using QuickTimeSampleMapping::FirstTrackOf;
     using QuickTimeSampleMapping::GetAlignedWidth;
     using QuickTimeSampleMapping::GetMediaTrack;
+    using QuickTimeSampleMapping::imageFormatsReady_;
+    using QuickTimeSampleMapping::levelRemap_;
     using QuickTimeSampleMapping::media_;
+    using QuickTimeSampleMapping::mediaTracks_;
     using QuickTimeSampleMapping::QuickTimeSampleMapping;
 };
 
@@ -117,7 +116,7 @@ protected:
     // the reader's code.
     std::vector<std::string> Offered(ncfUInt32 track) {
         std::vector<std::string> list;
-        for (const MediaFormatPtr& entry : mapping->_mediaTracks.at(track)->GetFormats()) {
+        for (const MediaFormatPtr& entry : mapping->mediaTracks_.at(track)->GetFormats()) {
             const auto& format = dynamic_cast<const QTImageFormat&>(*entry);
             list.push_back(std::to_string(format.pixelFormat) + "/" +
                            std::to_string(format.chromaSubSampling) + "/" +
@@ -130,7 +129,7 @@ protected:
     }
     const QTImageFormat& Format(ncfUInt32 track, std::size_t index) {
         return dynamic_cast<const QTImageFormat&>(
-            *mapping->_mediaTracks.at(track)->GetFormats().at(index));
+            *mapping->mediaTracks_.at(track)->GetFormats().at(index));
     }
     int Console(ncfUInt32 level, const std::string& text) {
         return host->console().count(level, text);
