@@ -99,7 +99,8 @@ AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
     for (const char* const name :
          {"AAFFileOpenTransient", "AAFFileOpenExistingRead", "AAFFileOpenNewModifyEx"}) {
         if (!library_.Find(name)) {
-            throw Failure(kExitCaller, file, fmt::format("is no AAF library: it lacks {}", name),
+            throw Failure(kExitCaller, file,
+                          fmt::format("is not an AAF library: it lacks {}", name),
                           "name another with --aaf-library FILE");
         }
     }

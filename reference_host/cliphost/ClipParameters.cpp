@@ -69,7 +69,7 @@ const host::ParameterInfo& FindParameter(const std::vector<host::ParameterInfo>&
         }
     }
     throw Failure(kExitCaller, "--set " + name,
-                  "the clip has no such parameter, but these:" +
+                  "the clip has no such parameter; it has these:" +
                       Listed(infos, [](const auto& info) { return info.name; }));
 }
 
@@ -94,7 +94,7 @@ ncfUInt32 FindValue(const host::ParameterInfo& info, const std::string& text) {
         return number;
     }
     throw Failure(kExitCaller, fmt::format("--set {}={}", info.name, text),
-                  found.empty() ? "there is no such choice" : "several choices begin so",
+                  found.empty() ? "there is no such choice" : "several choices begin with this",
                   "write one of these, or a number:" +
                       Listed(info.choices, [](const auto& choice) { return choice.text; }));
 }
@@ -199,7 +199,7 @@ void ClipParameters::Assign(const std::vector<std::string>& assignments) {
     for (const std::string& assignment : assignments) {
         const std::size_t equals = assignment.find('=');
         if (equals == std::string::npos) {
-            throw Failure(kExitCaller, "--set " + assignment, "it gives no value",
+            throw Failure(kExitCaller, "--set " + assignment, "the value is missing",
                           "write it as \"name=value\"");
         }
         const host::ParameterInfo& info = FindParameter(infos, assignment.substr(0, equals));
@@ -231,8 +231,8 @@ void ClipParameters::Apply(const std::string& xml, const std::filesystem::path& 
     std::string problem;
     if (host::ReadParameterDocument(xml, document, problem) >= 0 && !HoldsValues(document)) {
         Notice(
-            "cliphost: {}: no values for this clip are in use there, so none was "
-            "taken\n",
+            "cliphost: {}: its set in use has no values for this clip, so nothing was "
+            "changed\n",
             DisplayPath(file));
     }
 }

@@ -147,7 +147,7 @@ Problem Essence::Obstacle(const ClipTrack& track) {
     if (result == NCF_E_INVALIDARG) {
         return {movie_,
                 fmt::format("track {}: the movie has more than one picture track, and the module "
-                            "counts the further ones before the sound, so this sound can't be "
+                            "counts all of them before the sound, so this sound can't be "
                             "delivered",
                             track.number),
                 "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c "
@@ -218,7 +218,7 @@ Essence OpenEssence(Session& session, const std::filesystem::path& movie,
     Essence essence(session, movie, parameters);
     if (essence.undescribed()) {
         TellProblem(essence.undescribed(), session.verbosity());
-        Notice("  what can be mapped is served all the same\n");
+        Notice("  what can be mapped is still delivered\n");
     } else {
         TellRoute(movie, session.verbosity());
     }

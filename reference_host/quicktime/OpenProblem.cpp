@@ -66,12 +66,12 @@ CodecProblem ProblemOf(const AVStream& stream) {
         const std::string refused = OpeningProblem(*decoder, form);
         return refused.empty() ? CodecProblem()
                                : CodecProblem{track + "the decoder of its codec " + name +
-                                                  " does not take its description: " + refused,
+                                                  " rejects its description: " + refused,
                                               code};
     }
     if (IsOfOtherKind(form)) {
         return {track + "its handler calls it " + (isSound ? "sound" : "pictures") +
-                    ", its codec " + name + " is one of " + (isSound ? "pictures" : "sound"),
+                    ", but its codec " + name + " is for " + (isSound ? "pictures" : "sound"),
                 code};
     }
     const AVCodecDescriptor* const known = avcodec_descriptor_get(form.codec_id);
