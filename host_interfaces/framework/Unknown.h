@@ -21,7 +21,8 @@
 //                Reserved operation keeps a place: nobody calls it, and the host's
 //                answer is NCF_E_NOTIMPL.
 //   Arguments    `reserved` arguments are passed as 0 or null and ignored.
-//   Exceptions   None leaves an operation. IMediaContainer tells the one exception.
+//   Exceptions   None leaves an operation, except the two that say so: in IMediaContainer
+//                and in UTIL::INCFSaxDocumentHandler.
 
 // Root of every interface: finds the object's other interfaces, and counts who
 // holds it. Implemented by every object of host and module; called by both.

@@ -12,10 +12,12 @@ namespace UTIL {
 // INCFSaxParser::Parse, on the same thread. Strings are borrowed and valid for the
 // call only. A negative result ends the parse and is its result.
 struct INCFSaxDocumentHandler : INCFUnknown {
-    virtual NCFRESULT Start() = 0;                                         // 3
-    virtual NCFRESULT End() = 0;                                           // 4, after success only
-    virtual NCFRESULT Element(INCFString* tag) = 0;                        // 5. It begins.
-    virtual NCFRESULT Attribute(INCFString* name, INCFString* value) = 0;  // 6. of that element
+    virtual NCFRESULT Start() = 0;                   // 3
+    virtual NCFRESULT End() = 0;                     // 4, after success only
+    virtual NCFRESULT Element(INCFString* tag) = 0;  // 5. It begins.
+    // 6. Of that element. The module's handler lets through what is thrown and is no
+    // NCFRESULT, so a parser has to catch.
+    virtual NCFRESULT Attribute(INCFString* name, INCFString* value) = 0;
     // 7. One event for each run of text between markup, never trimmed.
     virtual NCFRESULT Text(INCFString* text) = 0;
 

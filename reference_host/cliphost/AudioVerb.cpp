@@ -45,9 +45,9 @@ std::uint64_t WantedCount(const AudioOptions& options, const SoundReader& sound)
     return std::min(options.count.value_or(left), left);
 }
 
-// Writes a file of sound from its first sample that could be read on: silence in
-// place of what can't be read is held back until something follows it, so that
-// none of it is written where nothing does.
+// Writes a file of sound, which begins with the first sample that could be read.
+// Samples that can't be read become silence, which is held back until a readable
+// sample follows: without one, no silence is written.
 class SoundCopy {
 public:
     SoundCopy(SoundReader& sound, const MissingSound& missing,

@@ -22,7 +22,7 @@ namespace {
 
 using host::DisplayPath;
 
-// Set that values of the command line stand in. It has no name of its own.
+// The set that takes the values of the command line. It has no name of its own.
 constexpr GUID kCommandLineSet = ncfGuid("4D7B2A90-51C8-4E3F-9C06-B1A87E25F31D");
 
 std::string Lower(std::string text) {
@@ -174,7 +174,7 @@ std::vector<ClipParameter> ClipParameters::List() {
     return list;
 }
 
-// Of the description, which stands also for a set whose identifier is zero.
+// Of the description, which is used too for a set whose identifier is zero.
 std::string ClipParameters::SetName() {
     const host::ParameterTrack track = Read(ParameterXml::kDescription).second;
     const host::ParameterSet* const set = track.SetInUse();

@@ -32,8 +32,8 @@ struct FrameOptions {
     ParameterOptions parameters;
 };
 
-// Writes the frames that the command line names; one that does not decode is
-// told and left out.
+// Writes the frames that the command line names; one that can't be decoded is
+// reported and skipped.
 class FrameRun {
 public:
     FrameRun(Essence& essence, const FrameOptions& options)

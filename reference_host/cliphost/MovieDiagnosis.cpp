@@ -52,8 +52,8 @@ std::string SecondsWords(ncfUInt64 units, const Track& track) {
     return Counted(seconds, "second");
 }
 
-// How often the pictures of the first track follow each other, and what makes
-// that no rate where it is a single one.
+// Why the pictures of the first track give no frame rate, and which sample is the
+// reason when it is a single one.
 std::string RateWords(const HeaderReport& header) {
     const ncfUInt32 place = TracksOf(header, TrackKind::Picture).front();
     const Track& track = header.movie->tracks[place];

@@ -14,7 +14,8 @@
 namespace cliphost {
 namespace {
 
-// Slower, a frame outlasts what a timecode counts; faster, no camera is.
+// With a lower rate a frame would last longer than timecode can count; no camera
+// has a higher one.
 constexpr double kSlowest = 0.01;
 constexpr double kFastest = 10000.0;
 

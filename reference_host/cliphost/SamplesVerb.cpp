@@ -27,8 +27,8 @@ struct SamplesOptions {
     bool json = false;
 };
 
-// Shows the maps of tracks: each sample of a picture, the runs of a sound, whose
-// samples are many and alike.
+// Shows the maps of tracks: each sample of a picture track, but only the runs of a
+// sound track, whose samples are many and alike.
 class SamplesRun {
 public:
     SamplesRun(Essence& essence, const SamplesOptions& options)

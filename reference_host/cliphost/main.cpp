@@ -27,8 +27,8 @@ std::filesystem::path ProgramFolder(const char* name) {
     return (error ? std::filesystem::absolute(name) : program).parent_path();
 }
 
-// A stream that the caller closed would give its number to the next file that is
-// opened, and what is printed would go into that file.
+// If the caller closed a standard stream, the next file that is opened would get
+// its number, and what is printed would go into that file.
 void KeepStandardStreams() {
     for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
         if (fcntl(stream, F_GETFD) < 0) {
@@ -42,7 +42,7 @@ void Tell(const std::string& text) {
     cliphost::Notice("cliphost: {}\n", text);
 }
 
-// What was printed may be lost as late as here.
+// Printed text may get lost even here, when buffers are flushed.
 int OutputStatus(int error, int status) {
     if (error == 0 || error == EPIPE) {
         return status;  // a reader that went away has seen enough

@@ -24,7 +24,7 @@ bool IsInterlacedRaster(ncfUInt32 width, ncfUInt32 height) {
 
 }  // namespace
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 NCFRESULT PictureDescriptor::DescribeFromClip() {

@@ -53,7 +53,7 @@ struct TrackMaker {
     NCFRESULT AddSoundSlots();
 };
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 NCFRESULT TrackMaker::ReadTiming() {

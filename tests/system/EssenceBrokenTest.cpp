@@ -1,8 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// Movies whose media are damaged or cut: one bad frame is one failure, and what
-// is there is served.
+// Movies whose media are damaged or cut: one bad frame is one failure, and everything
+// else is delivered.
 
 #include <algorithm>
 #include <fstream>
@@ -55,8 +55,8 @@ protected:
     }
 };
 
-// Nobody makes room for what the file can't hold, and every verb that gives or
-// promises pictures says why.
+// No memory is allocated for what the file can't hold, and every verb that delivers
+// or promises pictures says why.
 TEST_F(EssenceBroken, PicturesOfAFalseSizeAreNamedByEveryVerb) {
     const auto movie = folder() / "large.mov";
     for (const char* const encoder : {"mpeg4", "png", "rawvideo"}) {
