@@ -231,7 +231,7 @@ void ClipParameters::Apply(const std::string& xml, const std::filesystem::path& 
     std::string problem;
     if (host::ReadParameterDocument(xml, document, problem) >= 0 && !HoldsValues(document)) {
         Notice(
-            "cliphost: {}: its set in use has no values for this clip, so nothing was "
+            "cliphost: {}: no set in use there has values for this clip, so no value was "
             "changed\n",
             DisplayPath(file));
     }

@@ -14,7 +14,7 @@ std::string MachinePath(const std::filesystem::path& path);
 
 // What to say of it where --json is explained.
 inline constexpr char kJsonHelp[] =
-    "As JSON; a path that is no UTF-8 stands there as a file URL (file:///a%FF.mov), which every "
-    "verb takes in place of a path";
+    "As JSON; a path that is not UTF-8 is given as a file URL (file:///a%FF.mov), which every "
+    "verb accepts as a path";
 
 }  // namespace cliphost

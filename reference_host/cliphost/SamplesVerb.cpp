@@ -206,7 +206,7 @@ int SamplesRun::Run() {
 
 void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
-        app.add_subcommand("samples", "Show where the samples of a movie lie in its file");
+        app.add_subcommand("samples", "Show where the samples of a movie are in its file");
     verb->footer(
         "Example: cliphost samples clip.mov --track 0 --json\n"
         "Samples are listed in decode order. The offset says how many samples later in this "
@@ -214,7 +214,8 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
         "the file give exit status 1.");
     auto options = std::make_shared<SamplesOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("--track", options->track, "Only this one")->check(SmallWholeNumber());
+    verb->add_option("--track", options->track, "Only the track of this number")
+        ->check(SmallWholeNumber());
     verb->add_flag("--every", options->every, "List every sample of sound, not only its runs");
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {

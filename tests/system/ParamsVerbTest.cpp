@@ -129,7 +129,7 @@ TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
         {"--set 'Field Ordering'", 2, "name=value"},
         {"--set-xml /no/such/file.xml", 2, "there is no such file"},
         {"--set-xml " + Quoted(broken), 2, "1:16: no element found"},
-        {"--set-xml " + Quoted(other), 0, "none was taken"},
+        {"--set-xml " + Quoted(other), 0, "so no value was changed"},
         {"--xml everything", 2, "--xml"},
         {"--xml values --json", 2, "--json"},
     };
