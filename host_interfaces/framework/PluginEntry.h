@@ -13,7 +13,7 @@
 //   load        the system maps the file; the host finds all six functions
 //   register    NCFRegisterPlugin once, NCFRegisterComponent for each component
 //   start       NCFStartup
-//   create      NCFGetClassFactory, INCFClassFactory::CreateInstance   ┐ any number,
+//   create      NCFGetClassFactory, INCFClassFactory::CreateInstance    ┐ any number,
 //   use         calls to the objects                                    ┘ any order
 //   unload?     NCFCanUnloadNow, until it gives NCF_OK
 //   shut down   NCFShutdown
@@ -25,11 +25,10 @@
 //
 // Register. The module creates a definition object through the host's component
 // factory, fills it in and hands it over; the host owns it. The plug-in's definition
-// comes first, because it tells how many components there are: `index` goes from 0
-// to that number, and beyond it gives NCF_E_INVALIDARG. Both functions use nothing
-// but their arguments, so they work before NCFStartup: a host may remember what they
-// gave and skip them the next time, and a module that it does not want is never
-// started.
+// comes first, because it tells how many components there are: `index` is below that
+// number, and any other gives NCF_E_INVALIDARG. Both functions use nothing but their
+// arguments, so they work before NCFStartup: a host may remember what they gave and
+// skip them the next time, and a module that it does not want is never started.
 //
 // Start. NCFStartup takes the component factory from the host, starts the utility
 // library with it, finds the folder of the module's own file, where the data files
@@ -53,10 +52,10 @@
 // are alive still use what that takes away. After NCF_OK the host takes the
 // components out of its table, so that nobody makes an object meanwhile.
 //
-// Shut down. NCFShutdown forgets the folder and the data files, writes a last line,
-// stops the log, then the utility library; in this order, because the line needs the
-// log. It always gives NCF_OK. The module then holds nothing of the host, and may be
-// started again. A host that has to end while objects are alive shuts down too, but
+// Shut down. NCFShutdown forgets the folder and the data files, writes a last line
+// and stops the log; the utility library comes last, because everything before it
+// may use it. It always gives NCF_OK. The module then holds nothing of the host, and
+// may be started again. A host that has to end while objects are alive shuts down too, but
 // does not unmap: the objects' code must stay.
 //
 // Unmap. NCFStartup has added a reference to the library, so a module that was
