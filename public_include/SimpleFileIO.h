@@ -9,14 +9,14 @@
 
 namespace NMA::Impl {
 
-// Root of the volume that a path with backslashes stands on: the first three
+// Root of the volume of a path with backslashes: the first three
 // characters of "C:\...", "\\server\share\" of a network path with that much
 // in it, else empty.
 std::u16string VolumeRootOf(const std::u16string& path);
 
-// Reads a file past the system's cache, for callers that look at a few places
-// of it once. Such reads must start and end at sectors of the volume and land
-// at an aligned address; this class does that out of the caller's sight. The
+// Reads a file without the system's cache, for callers that read a few places of
+// it once. Such reads must start and end at sector borders of the volume and go to
+// an aligned address; this class hides that from its callers. The
 // file is opened by the first operation that needs it, which throws
 // NCF_E_HANDLE when that fails. One object belongs to one thread.
 class SimpleFileIO {

@@ -27,7 +27,7 @@ namespace {
 
 constexpr int kMovies = 1000;
 
-// Short movies of one picture and one sound track, gone with the process.
+// Short movies with one picture and one sound track, deleted when the process ends.
 class MovieFolder {
 public:
     MovieFolder()

@@ -7,8 +7,8 @@
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
 #include "reference_host/framework/Ref.h"
 
-// A film of 1920 by 1080 that the ffmpeg command makes once and that goes with
-// the program.
+// A film of 1920 by 1080 that the ffmpeg command makes once and that is deleted when
+// the program ends.
 class SampleFilm {
 public:
     SampleFilm(const std::string& codec, int frames);

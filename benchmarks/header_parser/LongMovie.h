@@ -12,7 +12,7 @@
 // in twelve. Its media are a hole.
 movies::Movie LongMovie(std::uint64_t samples);
 
-// The same as a sparse file in the temporary folder, gone with the object.
+// The same as a sparse file in the temporary folder, deleted with the object.
 class LongMovieFile {
 public:
     explicit LongMovieFile(std::uint64_t samples);

@@ -38,7 +38,7 @@ INCFComponentFactory* Factory() {
     return &host->factory();
 }
 
-// One file for the whole run, gone with it.
+// One file for the whole run, deleted at its end.
 const NMAString& TheFile(const std::uint8_t* data, std::size_t size) {
     static const TestFolder folder;
     static const std::filesystem::path path = folder / "data.xml";

@@ -33,7 +33,7 @@ void Require(bool holds, const char* what) {
     }
 }
 
-// A failure is as good as an answer, but it has words.
+// A failure is as good as an answer, but it needs an explanation.
 template <class Action>
 void Try(Action action) {
     try {

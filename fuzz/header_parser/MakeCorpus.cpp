@@ -1,7 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// Writes the builder's movies into a folder, each named after its defect:
+// Writes the movie builder's broken movies into a folder, each named after its defect:
 //
 //     header_parser_corpus FOLDER
 //

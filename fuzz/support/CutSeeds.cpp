@@ -1,8 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// cut_seeds FROM TO: makes seeds of the movies of a folder. Headers stay whole;
-// of the media data the first bytes stay, where the first samples lie.
+// cut_seeds FROM TO: makes seeds from the movies of a folder. Headers are kept whole;
+// of the media data the first bytes are kept, which contain the first samples.
 
 #include <algorithm>
 #include <cstdint>

@@ -8,8 +8,8 @@
 
 namespace fuzz {
 
-// A file for inputs of what opens files by their names: one for the process,
-// gone with it.
+// A file for the inputs of code that opens files by name: one for the process,
+// deleted at its end.
 class InputFile {
 public:
     explicit InputFile(const std::string& extension);

@@ -2,7 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-// Every published interface.
+// Every published interface, one header for each family of classes. The rules that
+// hold for all of them are in AAFUnknown.h. The build reads this list to write the
+// classes that answer AAFRESULT_NOT_IMPLEMENTED (cmake/NotImplementedInterfaces.cmake).
 #include "host_interfaces/aaf/AAFComponents.h"
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"

@@ -4,7 +4,8 @@
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
 
-// Ids of the built-in classes, under the names that the published headers use.
+// Ids of the built-in classes, under the names that the published headers use: what a
+// dictionary makes objects by. Two names of one id are both published.
 
 inline constexpr aafUID_t AUID_AAFObject = ncfGuid("0D010101-0101-0100-060E-2B3402060101");
 inline constexpr aafUID_t AUID_AAFInterchangeObject =

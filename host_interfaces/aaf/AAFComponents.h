@@ -4,7 +4,11 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Segments of slots: components, clips and what holds several of them.
+// Segments: what a mob's slot plays. A clip refers to a slot of another mob, a filler
+// to nothing; sequences, groups and scopes hold several. The module gives each slot
+// one clip, filler or sequence; the host prints them by their properties
+// (AAFObjects.h). Lengths are in edit units of the slot. A holder owns its parts: a
+// segment that has an owner can't be given to a second one.
 
 struct IAAFComponent;
 struct IAAFDataDef;

@@ -4,7 +4,7 @@
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
 
-// Ids of well-known definitions and labels.
+// Ids of well-known definitions and labels: what a dictionary finds definitions by.
 
 inline constexpr aafUID_t kAAFDataDef_Picture = ncfGuid("01030202-0100-0000-060E-2B3404010101");
 inline constexpr aafUID_t kAAFDataDef_LegacyPicture =

@@ -4,7 +4,10 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Definitions that objects refer to.
+// Definitions that objects refer to: of data (picture, sound, timecode), containers,
+// codecs, and of the keys of raw and tagged data. A file's dictionary owns them; one
+// definition stands for each id. The module looks them up there, and registers the
+// containers that its clips need.
 
 struct IAAFClassDef;
 struct IAAFCodecDef;

@@ -4,7 +4,11 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// What a source mob says of its essence.
+// What a source mob says of its essence, of whatever kind: a file, several files in
+// one, an import, a tape. The mob owns its descriptor, and the descriptor its
+// locators. The module gives the file mob a multiple descriptor, with a child for
+// each track, and the source mob an import descriptor. Pictures and sound:
+// AAFPictureDescriptors.h, AAFSoundDescriptors.h.
 
 struct IAAFCodecDef;
 struct IAAFContainerDef;

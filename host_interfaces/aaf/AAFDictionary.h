@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// The dictionary, which holds all definitions.
+// The dictionary: it makes the objects of a file and holds all definitions. Each
+// file has one, which the header gives out, always as the same pointer. The module
+// begins every description with it.
 
 struct IAAFClassDef;
 struct IAAFCodecDef;

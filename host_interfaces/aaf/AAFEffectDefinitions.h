@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Definitions of operations and their parameters.
+// Definitions of effects: operations, their parameters, and how values between two
+// points are found. A dictionary owns them. Neither module nor host uses effects; the
+// library has them for files of others.
 
 struct IAAFDataDef;
 struct IAAFInterpolationDef;

@@ -4,7 +4,8 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Effects: operations, transitions and their parameters.
+// Effects as segments: operations, transitions and the values of their parameters.
+// Neither module nor host makes them; the library has them for files of others.
 
 struct IAAFControlPoint;
 struct IAAFDataDef;

@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Essence stored in a file or reached through it.
+// Essence that is stored in a file or reached through it, in bytes of a stream. The
+// module describes movies where they are and stores none, and the host reads none
+// this way; the library has the objects for files of others.
 
 struct IAAFDataDef;
 struct IAAFEssenceData;

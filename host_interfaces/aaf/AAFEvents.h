@@ -4,7 +4,8 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Segments that mark a place: events, markers, triggers.
+// Segments that mark a place in time: events, markers, triggers. Neither module nor
+// host makes them; the library has them for files of others.
 
 struct IAAFDataDef;
 struct IAAFDescriptiveFramework;

@@ -4,7 +4,12 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Functions that the run-time library exports, with C linkage, by name.
+// Functions that the run-time library exports, with C linkage, by name: the way to
+// the first object. Module and host find them in the loaded library by these types;
+// the module opens a transient file for each description, the host opens files to
+// read and to save. Functions on different files may run on several threads; the
+// listeners that are set here hold for the whole process. What comes out belongs to
+// the caller.
 
 struct IAAFFile;
 struct IAAFRawStorage;

@@ -4,7 +4,12 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// The file and what holds its bytes.
+// The file: its header, the mobs that it contains, who wrote it, and what holds its
+// bytes. A file comes from an exported function (AAFExports.h) and lives as long as
+// anyone holds it. The module makes a transient one for each clip and hands it to the
+// host; the host opens, copies and saves files. IAAFProgress and IAAFDiagnosticOutput
+// are listeners: a caller implements them, and the library calls them on the thread
+// that is at work.
 
 struct IAAFContentStorage;
 struct IAAFDictionary;

@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Where essence lies.
+// Locators: where essence is, as a URL or as text for people. A descriptor owns them.
+// The module gives the descriptors of the file and the source mob a network locator
+// with the movie's file URL; the host prints it.
 
 struct IAAFLocator;
 struct IEnumAAFLocators;

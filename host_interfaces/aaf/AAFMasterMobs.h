@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Master mobs.
+// Master mobs: what a user sees as a clip in a bin. A master mob's slots lead to
+// those of file mobs. The module makes one for each clip, with a slot for each track;
+// the file owns it.
 
 struct IAAFDataDef;
 struct IAAFEssenceAccess;

@@ -4,7 +4,10 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Classes and properties: the model that every file carries.
+// Classes and properties: the model that every file carries, so that a reader can
+// read what it does not know. The dictionary owns them. The module makes objects by
+// their class and registers properties of its own; the host asks them for names when
+// it prints a description. A definition is made by CreateMetaInstance only.
 
 struct IAAFClassDef;
 struct IAAFPropertyDef;

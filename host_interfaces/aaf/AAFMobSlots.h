@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Slots of mobs.
+// Slots: the tracks of a mob, each with a number, a name, an edit rate and one
+// segment. A mob owns its slots. The module makes timeline slots; it and the host
+// list them.
 
 struct IAAFDataDef;
 struct IAAFEventMobSlot;

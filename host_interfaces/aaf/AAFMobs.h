@@ -4,7 +4,10 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Mobs, and how they are found.
+// Mobs: things with an identity, such as a clip, a file or a tape; and how they are
+// found. A mob that was added to a file's header belongs to the file. The module makes
+// a master, a file and a source mob for each clip; the host lists, prints and copies
+// them.
 
 struct IAAFDataDef;
 struct IAAFEssenceDescriptor;

@@ -4,7 +4,10 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// What all objects share: properties, values, comments, raw data.
+// What all objects share: their properties with values, and comments and raw data
+// that may be attached. The host prints a description through them without knowing
+// its classes; the module attaches attributes and properties of its own. A value
+// belongs to its type, which reads and writes it.
 
 struct IAAFClassDef;
 struct IAAFDictionary;

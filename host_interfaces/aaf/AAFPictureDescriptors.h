@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// What a source mob says of pictures.
+// What a source mob says of pictures: size, layout, sampling, levels, codec. Sizes are
+// in pixels and lines, of one field when fields are stored apart. The module fills
+// one for each picture track; the host reads them when it prints a description.
 
 // Answered by AAFDigitalImageDescriptor.
 struct IAAFDigitalImageDescriptor : IUnknown {

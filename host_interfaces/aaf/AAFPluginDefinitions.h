@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Definitions of plug-ins, and what looks after them.
+// Definitions of the library's own plug-ins, and the manager that looks after them.
+// They have nothing to do with the modules of this project's framework. Neither module
+// nor host uses them.
 
 struct IAAFDefObject;
 struct IAAFDictionary;

@@ -4,7 +4,8 @@
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
 
-// Result codes of the published interfaces.
+// Result codes of the published interfaces. AAFResultToText (AAFExports.h) names
+// them.
 
 inline constexpr AAFRESULT AAFRESULT_SUCCESS = static_cast<AAFRESULT>(0x00000000u);
 inline constexpr AAFRESULT AAFRESULT_WRONG_OPENMODE = static_cast<AAFRESULT>(0x8012001Fu);

@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// What a source mob says of sound.
+// What a source mob says of sound: rate in frames a second, channels, bits of a
+// sample, and what its file format adds. The module fills one for each sound track;
+// the host reads them when it prints a description.
 
 struct IAAFRIFFChunk;
 struct IEnumAAFRIFFChunks;

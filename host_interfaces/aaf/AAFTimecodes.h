@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Segments that count: timecode, edge code, pulldown.
+// Segments that count: timecode, edge code, pulldown. Starts and lengths are in
+// frames. The module makes timecodes, for slots of their own; neither it nor the host
+// makes the others.
 
 struct IAAFSegment;
 

@@ -4,7 +4,10 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Types of single values.
+// Types of single values: numbers, records, texts, enumerations, and names for other
+// types. A type makes, reads and writes values (IAAFPropertyValue) of its kind; sizes
+// are in bytes. The dictionary owns types. The module writes properties of its own
+// with them; the host prints values.
 
 struct IAAFPropertyValue;
 struct IAAFTypeDef;

@@ -4,7 +4,9 @@
 
 #include "host_interfaces/aaf/AAFUnknown.h"
 
-// Types of arrays, sets, streams and references.
+// Types of several values and of references: arrays, sets, streams, objects owned or
+// referred to. Counts and indexes are of elements, from 0; sizes are in bytes. Owned
+// and used as the types of single values.
 
 struct IAAFClassDef;
 struct IAAFPlainStreamData;

@@ -4,7 +4,7 @@
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
 
-// Ids of the built-in types.
+// Ids of the built-in types: what a dictionary finds types by.
 
 inline constexpr aafUID_t kAAFTypeID_UInt8 = ncfGuid("01010100-0000-0000-060E-2B3401040101");
 inline constexpr aafUID_t kAAFTypeID_UInt16 = ncfGuid("01010200-0000-0000-060E-2B3401040101");

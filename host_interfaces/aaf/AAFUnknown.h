@@ -4,8 +4,34 @@
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
 
-// Root of the published interfaces. A pointer given out carries one reference
-// that belongs to the caller; arguments are borrowed.
+// The published AAF interfaces: names, ids, operations and their order are those of
+// the published library, because any build of it may stand behind them. What holds
+// for all of them, and each header then says for its family:
+//
+//   Who          The AAF library implements them; module and host call them, the
+//                module to describe a clip, the host to read, print and save what
+//                the module described. Neither implements one, except the listeners
+//                in AAFFile.h. Objects of two libraries never meet in one file.
+//   When         From the library's loading to the end of the process. An object is
+//                made by a dictionary or a class definition, needs its Initialize
+//                where its interface has one, and is then part of one file.
+//   Threads      One thread at a time for a file and for all of its objects;
+//                different files may be used on different threads. Reference
+//                counts are not guarded either.
+//   References   A pointer that comes out carries one reference, which the caller
+//                releases; pointers that go in are borrowed, and who keeps one takes
+//                a reference. Objects held outside stay usable when their file is
+//                closed. After a failure an output may be untouched: set it to null
+//                before the call.
+//   Texts        Zero-terminated characters of 16 bits. Who wants one asks for its
+//                length (...BufLen, in bytes with the terminator) and gives a
+//                buffer of that size.
+//   Results      HRESULT: 0 is success, AAFResultCodes.h lists the failures. An
+//                operation that the library lacks gives AAFRESULT_NOT_IMPLEMENTED.
+//   Arguments    Have the published names; units are those of the AAF object model:
+//                lengths and positions in edit units, rates as fractions a second.
+//
+// Root of them all: finds an object's other interfaces and counts who holds it.
 struct IUnknown {
     virtual HRESULT QueryInterface(REFIID iid, void** out) = 0;
     virtual ULONG AddRef() = 0;

@@ -4,12 +4,16 @@
 
 #include "host_interfaces/framework/Buffer.h"
 
-// A request for samples: which ones of which track, and where they go. Made by
-// the host for one call of a sample provider.
+// A request for samples: which ones of which track, and where they go.
+//
+// Implemented by the host, which passes one to each call of
+// ISampleProvider::ProvideSampleRange and may use it again for the next. The
+// module asks it during that call, on that thread, and keeps nothing of it.
 struct INCFAVBuffer : INCFUnknown {
-    virtual NCFRESULT GetBuffer(INCFBuffer** buffer) = 0;  // 3. A new reference.
-    // 4. The host's track number, the first sample and the count, all from
-    // zero.
+    // 3. Where the samples go, with a reference for the caller.
+    virtual NCFRESULT GetBuffer(INCFBuffer** buffer) = 0;
+    // 4. The host's track number and the first sample, both from zero, and how
+    // many samples: one picture, or frames of sound.
     virtual NCFRESULT GetSampleRange(ncfUInt32* track, ncfUInt64* sample, ncfUInt64* count) = 0;
 
 protected:

@@ -8,14 +8,19 @@
 inline constexpr ncfUInt32 kNCFBuffer_Complete = 3;
 
 // A block of memory of the host: output of a sample request, or a list of
-// 32-bit pixel format codes.
+// 32-bit pixel format codes (IQuickTimeProperty).
+//
+// Implemented by the host. For samples the module calls 3, 4 and 5 in this order,
+// within one ProvideSampleRange; from a list of codes it reads by 4 alone. The
+// memory belongs to the buffer, and lasts until the next Allocate or its end.
 struct INCFBuffer : INCFUnknown {
-    // 3. Makes room for `size` bytes at a multiple of `alignment`; zeroed.
+    // 3. Makes room for `size` bytes at a multiple of `alignment` bytes, which is
+    // 0 (any place) or a power of two; zeroed. What was there before is lost.
     virtual NCFRESULT Allocate(ncfUInt64 size, ncfUInt32 alignment) = 0;
-    // 4. Start of the block, owned by the buffer, null before Allocate.
+    // 4. Start of the block, null before Allocate.
     virtual NCFRESULT GetBufferPointer(void** start) = 0;
-    // 5. Hands the content over: how many bytes are valid and with which
-    // result they were made.
+    // 5. Hands the content over: kNCFBuffer_Complete, how many bytes are valid
+    // (at most those allocated), and with which result they were made.
     virtual NCFRESULT SetComplete(ncfUInt32 state, ncfUInt64 validBytes, NCFRESULT result) = 0;
 
 protected:

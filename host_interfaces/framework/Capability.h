@@ -5,8 +5,13 @@
 #include "host_interfaces/framework/Unknown.h"
 
 // Tells containers which of two ways of access the host prefers.
+//
+// Implemented by the host as a component of its own, one object for all.
+// QuickTimeContainer creates it when it is made, goes on without it when there is
+// none, and asks it in GetCapabilities. Thread-safe.
 struct INCFCapability : INCFUnknown {
-    // 3. The caller zeroes the value and ignores the result.
+    // 3. 0 or not: the container adds flag 256 or 512. The caller zeroes the value
+    // and ignores the result.
     virtual NCFRESULT GetValue(ncfUInt32* value) = 0;
 
 protected:

@@ -13,13 +13,17 @@
 #define NCF_PRINTF(text, first)
 #endif
 
-// The user's console. Levels in use: 1 failures shown to the user, 2 notices,
-// 4 details. Thread-safe. Obtained by QueryInterface on the host unknown.
+// The user's console: lines of text with a level. Levels in use: 1 failures shown
+// to the user, 2 notices, 4 details.
+//
+// Implemented by the host; the module queries the host unknown for it when an
+// object is made, and writes at any time. Thread-safe. What goes in is formatted
+// during the call, so nothing has to outlive it.
 struct INCFConsole : INCFUnknown {
     virtual NCFRESULT ReservedConsoleOperationA() = 0;  // 3
     virtual NCFRESULT ReservedConsoleOperationB() = 0;  // 4
-    // 5. Writes a formatted line; texts are UTF-8. Text that comes from a file
-    // is an argument, never the format.
+    // 5. Writes a formatted line; texts are UTF-8, zero-terminated. Text that comes
+    // from a file is an argument, never the format.
     virtual NCFRESULT Write(ncfUInt32 level, const char* format, ...) NCF_PRINTF(3, 4) = 0;
 
 protected:

@@ -4,17 +4,25 @@
 
 #include "host_interfaces/framework/Unknown.h"
 
-// The two definition objects that a module fills in when it registers.
+// The two definition objects that a module fills in when it registers. The module
+// creates them through the host's component factory instead of bringing its own,
+// so the host can read back what it holds without asking the module.
 
 // Describes one plug-in module.
+//
+// Implemented by the host. Filled in by NCFRegisterPlugin, which hands it to the
+// host as its output; the module keeps no reference. One thread at a time.
 struct INCFPluginDefinition : INCFUnknown {
-    // 3. Stores a copy of `bytes` bytes of `value` under an attribute id. Text
-    // is UTF-8 and may have the length 0xFFFFFFFF, zero-terminated.
+    // 3. Stores a copy of `bytes` bytes of `value` under an attribute id; the type
+    // is one of those below. Text is UTF-8; with 0xFFFFFFFF bytes it ends at its
+    // zero. Attributes keep the order in which they were set.
     virtual NCFRESULT SetAttribute(const GUID& attribute, const GUID& valueType, const void* value,
                                    ncfUInt32 bytes) = 0;
     virtual NCFRESULT ReservedPluginDefinitionA() = 0;  // 4
     virtual NCFRESULT ReservedPluginDefinitionB() = 0;  // 5
-    // 6. Names and vendor are UTF-8, copied.
+    // 6. Names the module: its id and version, how many components it has (their
+    // indexes go from 0), and its name and vendor in UTF-8, which are copied. What
+    // the second id and the last number (1) mean is the host's affair.
     virtual NCFRESULT Define(const GUID& pluginId, ncfUInt32 major, ncfUInt32 minor,
                              const char* name, const GUID& secondId, const char* vendor,
                              ncfUInt32 componentCount, ncfUInt32 last) = 0;
@@ -30,6 +38,9 @@ constexpr const GUID& ncfIdOf(const INCFPluginDefinition*) {
 }
 
 // Describes one component of a module.
+//
+// Implemented by the host. Filled in by NCFRegisterComponent, once for each index,
+// and handed over like the definition of the module.
 struct INCFComponentDefinition : INCFUnknown {
     // 3. As INCFPluginDefinition::SetAttribute.
     virtual NCFRESULT SetAttribute(const GUID& attribute, const GUID& valueType, const void* value,
@@ -37,7 +48,8 @@ struct INCFComponentDefinition : INCFUnknown {
     virtual NCFRESULT ReservedComponentDefinitionA() = 0;  // 4
     virtual NCFRESULT ReservedComponentDefinitionB() = 0;  // 5
     // 6. `componentId` is what callers create by, `classId` what reaches
-    // NCFGetClassFactory. The display name is UTF-8, copied.
+    // NCFGetClassFactory; the type is the same for all components of a module. The
+    // display name is UTF-8, copied.
     virtual NCFRESULT Define(const GUID& componentId, const GUID& componentType, ncfUInt32 major,
                              ncfUInt32 minor, const GUID& classId, const char* displayName) = 0;
 

@@ -7,10 +7,15 @@
 namespace NMA {
 
 // Settings that the user makes in the host.
+//
+// Implemented by the host as a component. The module creates it when a clip with a
+// picture is loaded and asks for NMAHostSetting_IgnoreAlpha; without an answer the
+// clip keeps its own way. Thread-safe, since one object may serve all clips.
 struct IHostSettings : INCFUnknown {
+    // The scope in which the module asks.
     static constexpr ncfUInt32 kUserScope = 64;
 
-    // 3. Reads a flag. A setting that was never made gives
+    // 3. Reads a flag, 0 or not, of a scope. A setting that was never made gives
     // NCF_E_PARAMETERNOTAVAILABLE and leaves the value untouched.
     virtual NCFRESULT GetHostSettingBoolean(const GUID& setting, ncfUInt32 scope,
                                             ncfBool* value) = 0;

@@ -4,11 +4,17 @@
 
 #include "host_interfaces/framework/Unknown.h"
 
-// A recursive lock of the host: one thread may take it several times and gives
-// it back as often.
+// A recursive lock: one thread may take it several times and gives it back as
+// often.
+//
+// Implemented by the host as a component, so that module and host wait in the same
+// way. The module creates one for its log at NCFStartup and one for each sample
+// mapping, and holds it for as long as a frame takes. Both operations may be called
+// on any thread, at once.
 struct INCFLock : INCFUnknown {
-    virtual NCFRESULT Lock() = 0;    // 3. Waits without limit.
-    virtual NCFRESULT Unlock() = 0;  // 4. Only by the thread that holds it.
+    virtual NCFRESULT Lock() = 0;  // 3. Waits without limit.
+    // 4. By the thread that holds it; by another, NCF_E_FAIL.
+    virtual NCFRESULT Unlock() = 0;
 
 protected:
     ~INCFLock() = default;

@@ -16,10 +16,15 @@ enum NCFStringEncoding : ncfUInt32 {
 // Length of a zero-terminated text whose units are not counted by the caller.
 inline constexpr ncfUInt32 kNCFZeroTerminated = 0xFFFFFFFFu;
 
-// Mutable text, held in one encoding at a time. A new string is empty and in
-// UTF-16. One string belongs to one thread at a time.
+// Mutable text, held in one encoding at a time: every text that crosses the border
+// as an object. A new string is empty and in UTF-16.
 //
-// Bytes of a file name that are no UTF-8 are carried as lone surrogates,
+// Implemented by the host as a component; module, utility library and host create
+// and call it. One string belongs to one thread at a time. Raw pointers that it
+// gives out belong to it.
+//
+// A path that goes to the module has backslashes between its parts, on every
+// system. Bytes of a file name that are no UTF-8 are carried as lone surrogates,
 // U+DC00 plus the byte.
 struct INCFString : INCFUnknown {
     // 3. The encoding held, one of NCFStringEncoding: the value, no result.
@@ -28,9 +33,9 @@ struct INCFString : INCFUnknown {
     virtual ncfUInt32 GetLength() = 0;
     // 5. Non-zero when the length is 0.
     virtual ncfBool IsEmpty() = 0;
-    // 6. Takes text and encoding of `source`, which is borrowed.
+    // 6. Takes text and encoding of `source`.
     virtual NCFRESULT Assign(INCFString* source) = 0;
-    // 7 to 9. Take `units` code units of `text`, or all up to the terminator
+    // 7 to 9. Copy `units` code units of `text`, or all up to the terminator
     // with kNCFZeroTerminated, and hold them in the encoding `keepAs`.
     virtual NCFRESULT AssignUTF8(ncfUInt32 keepAs, const ncfUTF8* text, ncfUInt32 units) = 0;
     virtual NCFRESULT AssignUTF16(ncfUInt32 keepAs, const ncfUTF16* text, ncfUInt32 units) = 0;
@@ -47,8 +52,9 @@ struct INCFString : INCFUnknown {
     virtual NCFRESULT GetRawUTF16(ncfUTF16** out) = 0;
     virtual NCFRESULT GetRawUTF32(ncfUTF32** out) = 0;
     virtual NCFRESULT GetRawWCHAR(ncfWCHAR** out) = 0;
-    // 16. Finds a character from element `from`, inclusive, in code units of
-    // the encoding held. Not found is NCF_OK with -1 in `at`.
+    // 16. Finds a character, in code units of the encoding held, from element
+    // `from` (included) to the end, or to the beginning when `forward` is 0. Not
+    // found is NCF_OK with -1 in `at`.
     virtual NCFRESULT FindCharacter(ncfUTF32 character, ncfSInt32 from, ncfBool forward,
                                     ncfSInt32* at) = 0;
     // 17. Finds `units` units of `text` from element `from`; the string must

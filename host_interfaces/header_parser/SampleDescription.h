@@ -4,7 +4,8 @@
 
 #include "host_interfaces/framework/String.h"
 
-// What a movie stores about the resolution of its picture.
+// What a movie stores about the resolution of its picture: the id of a row in the
+// module's data files, and room that is zero.
 struct QTNivoResolution {
     ncfUInt32 id;
     ncfUInt32 reserved[7];
@@ -12,10 +13,15 @@ struct QTNivoResolution {
 static_assert(sizeof(QTNivoResolution) == 32, "the parser fills a record of 32 bytes");
 
 // Video sample description (ISO/IEC 14496-12, 12.1.3; QuickTime File Format,
-// Video Media). Four-character codes are numbers with the first character in
-// the most significant byte.
+// Video Media): what the samples of a video track are.
+//
+// Implemented by the host's header parser, given out by IVideoTrackInfo; the module
+// asks the first description of the first video track while it loads and describes
+// a clip. One thread at a time; nothing changes. Strings belong to the caller.
+// Four-character codes are numbers with the first character in the most significant
+// byte.
 struct IVideoSampleDescription : INCFUnknown {
-    virtual NCFRESULT GetDataFormat(ncfUInt32* dataFormat) = 0;  // 3
+    virtual NCFRESULT GetDataFormat(ncfUInt32* dataFormat) = 0;  // 3. a code
     virtual NCFRESULT ReservedVideoDescription4() = 0;           // 4
     // 5. Pixels of the encoded picture.
     virtual NCFRESULT GetEncodedWidthAndHeight(ncfUInt16* width, ncfUInt16* height) = 0;
@@ -23,7 +29,7 @@ struct IVideoSampleDescription : INCFUnknown {
     virtual NCFRESULT ReservedVideoDescription7() = 0;  // 7
     virtual NCFRESULT ReservedVideoDescription8() = 0;  // 8
     virtual NCFRESULT ReservedVideoDescription9() = 0;  // 9
-    // 10. Depth 32, or a codec that carries alpha by itself.
+    // 10. Not 0: depth 32, or a codec that carries alpha by itself.
     virtual NCFRESULT HasAlpha(ncfSInt32* hasAlpha) = 0;
     virtual NCFRESULT ReservedVideoDescription11() = 0;  // 11
     // 12. Fields in a frame, 1 or 2, whether the top one is first and whether
@@ -36,7 +42,7 @@ struct IVideoSampleDescription : INCFUnknown {
     virtual NCFRESULT ReservedVideoDescription15() = 0;  // 15
     virtual NCFRESULT ReservedVideoDescription16() = 0;  // 16
     virtual NCFRESULT ReservedVideoDescription17() = 0;  // 17
-    // 18. 0 when the description names none.
+    // 18. A code, 0 when the description names none.
     virtual NCFRESULT GetVendor(ncfUInt32* vendor) = 0;
     // 19. Ratio of the whole picture, clean aperture times pixel aspect,
     // reduced; both numbers above 0.
@@ -47,7 +53,8 @@ struct IVideoSampleDescription : INCFUnknown {
     virtual NCFRESULT ReservedVideoDescription21() = 0;  // 21
     virtual NCFRESULT ReservedVideoDescription22() = 0;  // 22
     virtual NCFRESULT ReservedVideoDescription23() = 0;  // 23
-    // 24, 25. Alpha codings that a code of the form NV.. lists.
+    // 24, 25. Alpha codings that a code of the form NV.. lists, `index` from zero;
+    // a coding of 0 is "no alpha".
     virtual NCFRESULT GetNivoAlphaCodingCount(ncfUInt32* count) = 0;
     virtual NCFRESULT GetNivoAlphaCoding(ncfUInt32 index, ncfUInt32* coding) = 0;
     // 26. NCF_E_PARAMETERNOTAVAILABLE without resolution atom.
@@ -69,7 +76,11 @@ constexpr const GUID& ncfIdOf(const IVideoSampleDescription*) {
 }
 
 // Sound sample description, versions 0, 1 and 2 (QuickTime File Format, Sound
-// Media; ISO/IEC 14496-12, 12.2.3).
+// Media; ISO/IEC 14496-12, 12.2.3): what the samples of a sound track are.
+//
+// Implemented by the host's header parser, given out by IAudioTrackInfo; the module
+// asks the first description of each sound track while it describes and maps a
+// clip. One thread at a time; nothing changes.
 struct IAudioSampleDescription : INCFUnknown {
     virtual NCFRESULT ReservedAudioDescription3() = 0;               // 3
     virtual NCFRESULT ReservedAudioDescription4() = 0;               // 4
@@ -78,12 +89,12 @@ struct IAudioSampleDescription : INCFUnknown {
     virtual NCFRESULT GetBitsPerChannel(ncfUInt32* bits) = 0;
     // 7. Frames per second, above 0 and at most 10^9.
     virtual NCFRESULT GetSampleRate(double* rate) = 0;
-    virtual NCFRESULT IsConstantBitRate(ncfBool* constant) = 0;  // 8
-    virtual NCFRESULT IsLPCM(ncfBool* isLPCM) = 0;               // 9
+    virtual NCFRESULT IsConstantBitRate(ncfBool* constant) = 0;  // 8. not 0: it is
+    virtual NCFRESULT IsLPCM(ncfBool* isLPCM) = 0;               // 9. not 0: it is
     // 10. Bytes of one frame of all channels for linear sound, of one packet
     // for compressed sound of constant size, else 0.
     virtual NCFRESULT GetBytesPerPacket(ncfUInt32* bytes) = 0;
-    virtual NCFRESULT IsLittleEndian(ncfBool* littleEndian) = 0;  // 11
+    virtual NCFRESULT IsLittleEndian(ncfBool* littleEndian) = 0;  // 11. not 0: it is
 
 protected:
     ~IAudioSampleDescription() = default;

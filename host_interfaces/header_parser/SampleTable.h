@@ -13,10 +13,15 @@ enum QTSampleFlags : ncfUInt32 {
 
 // The samples of one track in decode order, numbered from 1. A number of 0 or
 // above the count gives NCF_E_INVALIDARG and leaves the output untouched.
+//
+// Implemented by the host's header parser, given out by ITrackInfo; the module asks
+// it for each question of a sample mapping, and a host may ask a mapping about
+// millions of samples: an answer must not cost a walk from the beginning. One thread
+// at a time. Positions are in bytes of the file.
 struct IQTSampleTable : INCFUnknown {
     // 3. ISO/IEC 14496-12, 8.7.3 (stsz, stz2).
     virtual NCFRESULT GetNumSamples(ncfUInt64* numSamples) = 0;
-    // 4. Place of the sample's first byte in its file.
+    // 4. Place of the sample's first byte.
     virtual NCFRESULT GetDataOffset(ncfUInt64 sample, ncfUInt64* position) = 0;
     // 5. One of QTSampleFlags; stss and sdtp, 8.6.2 and 8.6.4.
     virtual NCFRESULT GetSampleFlags(ncfUInt64 sample, ncfUInt32* flags) = 0;
@@ -37,9 +42,9 @@ struct IQTSampleTable : INCFUnknown {
     // 11. Non-zero when any shifted display offset is not 0.
     virtual NCFRESULT GetHasOutOfOrderFrameDependencies(ncfBool* outOfOrder) = 0;
     // 12. Place and size in bytes of chunk number (count / 2), from zero.
-    // NMA_E_NODATA without chunks.
+    // NMA_E_NODATA without chunks. It stands for the track in the content hash.
     virtual NCFRESULT GetChunkFromTheMiddle(ncfUInt64* position, ncfUInt64* size) = 0;
-    // 13. The sample shown at a display time in media time units.
+    // 13. The number of the sample shown at a display time in media time units.
     virtual NCFRESULT DisplayTimeToFrameNum(ncfUInt64 displayTime, ncfUInt64* sample) = 0;
 
 protected:

@@ -5,8 +5,12 @@
 #include "host_interfaces/header_parser/SampleDescription.h"
 #include "host_interfaces/header_parser/SampleTable.h"
 
-// One track of a parsed movie. Interface outputs carry a reference that the
-// caller releases.
+// One track of a parsed movie: the facts of its header.
+//
+// Implemented by the host's header parser, given out by IQTParser 14 to 17; the
+// module asks while it loads, describes and maps a clip. One thread at a time, but
+// different tracks may be asked at once. Nothing changes once it is given out. What
+// comes out belongs to the caller and outlives the track.
 struct ITrackInfo : INCFUnknown {
     virtual NCFRESULT ReservedTrack3() = 0;  // 3
     virtual NCFRESULT ReservedTrack4() = 0;  // 4
@@ -32,12 +36,13 @@ struct ITrackInfo : INCFUnknown {
     virtual NCFRESULT GetMediaTS(ncfUInt32* timescale) = 0;
     // 15. In media time units.
     virtual NCFRESULT GetMediaDuration(ncfUInt32* duration) = 0;
-    virtual NCFRESULT GetSampleTable(IQTSampleTable** table) = 0;       // 16
-    virtual NCFRESULT GetSampleDescriptionCount(ncfUInt32* count) = 0;  // 17
-    virtual NCFRESULT ReservedTrack18() = 0;                            // 18
-    virtual NCFRESULT ReservedTrack19() = 0;                            // 19
-    virtual NCFRESULT ReservedTrack20() = 0;                            // 20
-    virtual NCFRESULT ReservedTrack21() = 0;                            // 21
+    virtual NCFRESULT GetSampleTable(IQTSampleTable** table) = 0;  // 16
+    // 17. How many sample descriptions the track has; 0 is possible.
+    virtual NCFRESULT GetSampleDescriptionCount(ncfUInt32* count) = 0;
+    virtual NCFRESULT ReservedTrack18() = 0;  // 18
+    virtual NCFRESULT ReservedTrack19() = 0;  // 19
+    virtual NCFRESULT ReservedTrack20() = 0;  // 20
+    virtual NCFRESULT ReservedTrack21() = 0;  // 21
 
 protected:
     ~ITrackInfo() = default;
@@ -48,6 +53,7 @@ constexpr const GUID& ncfIdOf(const ITrackInfo*) {
     return IID_ITrackInfo;
 }
 
+// A video track; the module queries an ITrackInfo for it too.
 struct IVideoTrackInfo : ITrackInfo {
     // 22. Display matrix of the track, nine numbers row by row (a b u, c d v,
     // x y w; ISO/IEC 14496-12, 6.2.2).
@@ -66,6 +72,7 @@ constexpr const GUID& ncfIdOf(const IVideoTrackInfo*) {
     return IID_IVideoTrackInfo;
 }
 
+// A sound track; the module queries an ITrackInfo for it too.
 struct IAudioTrackInfo : ITrackInfo {
     // 22. The result is the answer: 0 constant, 1 not, negative failure. The
     // output may be null.

@@ -9,10 +9,16 @@ struct IAAFFile;
 namespace NMA {
 
 // Descriptions of one or more clips, each an in-memory AAF file.
+//
+// Implemented by the module, for a folder (QuickTimeMasterClips, from
+// IMediaFormat::GetAAFClips) and for one file (from
+// IMediaContainer::GetAAFMasterClips). Called by the host, on one thread at a time.
+// A folder's list describes a clip when it is asked for it and keeps nothing; a
+// container's list gives the description that the container made last.
 struct IAAFClips : INCFUnknown {
     // 3. Number of clips: the value, no result.
     virtual ncfSInt32 GetCount() = 0;
-    // 4. The description of a clip with a reference for the caller.
+    // 4. The description of clip `index`, from 0, with a reference for the caller.
     // NCF_E_NOTFOUND for an index that is not there.
     virtual NCFRESULT GetMetadata(ncfSInt32 index, IAAFFile** ppData) = 0;
     // 5. Path of a clip, assigned to the caller's string. NCF_E_NOTIMPL where

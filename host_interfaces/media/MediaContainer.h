@@ -8,14 +8,22 @@ namespace NMA {
 
 struct ISampleMapping;
 
-// The host's handle on one media file. One thread at a time.
+// The host's handle on one media file.
+//
+// Implemented by the module (QuickTimeContainer), as one object with the two
+// interfaces below. The host creates it by CompID_QuickTimeContainer, gives it a
+// path once, and asks it from one thread at a time. The clip is loaded at the first
+// operation that needs it, and shared with every sample mapping, so mappings may
+// outlive the container.
 struct IMediaContainer : INCFUnknown {
     // 3. 1 when the file could be loaded, 0 when not. May throw an NCFRESULT:
     // the one operation that does, for a file that can't be opened.
     virtual NCFRESULT IsContainerSupported() = 0;
-    virtual NCFRESULT ContainerFlag() = 0;                                   // 4: 1
-    virtual NCFRESULT ContainerUnsupportedA(void* a, void* b, void* c) = 0;  // 5
-    // 6. Describes the clip anew.
+    virtual NCFRESULT ContainerFlag() = 0;  // 4: 1
+    // 5. NCF_E_NOTIMPL.
+    virtual NCFRESULT ContainerUnsupportedA(void* reservedA, void* reservedB, void* reservedC) = 0;
+    // 6. Describes the clip anew, in place of the description before. NCF_E_POINTER
+    // without a path.
     virtual NCFRESULT GetAAFMasterClips(IAAFClips** ppClips) = 0;
     // 7. Works once: NMA_E_ALREADYSET afterwards. The string is copied.
     virtual NCFRESULT SetFilePath(INCFString* path) = 0;
@@ -24,20 +32,25 @@ protected:
     ~IMediaContainer() = default;
 };
 
+// The same handle: the way to the file's essence.
 struct IMediaContainer2 : IMediaContainer {
     // 8. A new mapping over the clip, which it shares with all others: no two of
     // them may deliver at once, see SampleMapping.h.
     virtual NCFRESULT GetSampleMapping(ISampleMapping** ppSampleMapping) = 0;
-    virtual NCFRESULT ContainerUnsupportedB(void* a) = 0;  // 9
+    virtual NCFRESULT ContainerUnsupportedB(void* reserved) = 0;  // 9. NCF_E_NOTIMPL
 
 protected:
     ~IMediaContainer2() = default;
 };
 
+// The same handle: what containers of this kind can do. Needs no path.
 struct IMediaContainer3 : IMediaContainer2 {
-    virtual NCFRESULT GetCapabilities(ncfUInt32* flags) = 0;  // 10
-    virtual ncfUInt32 GetFileTypeCount() = 0;                 // 11: the value
-    // 12. One file type; each output may be null, else it is a new string.
+    // 10. 16387 plus 256, or plus 512 when the host's INCFCapability says so.
+    virtual NCFRESULT GetCapabilities(ncfUInt32* flags) = 0;
+    virtual ncfUInt32 GetFileTypeCount() = 0;  // 11: the value
+    // 12. File type `index`, from 0: its extension in capitals, what it is called,
+    // and the name of its group. Each output may be null, else it is a new string
+    // of the caller. NCF_E_NOTFOUND beyond the count.
     virtual NCFRESULT GetFileType(ncfUInt32 index, INCFString** extension, INCFString** description,
                                   INCFString** group) = 0;
 

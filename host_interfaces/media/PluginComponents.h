@@ -4,7 +4,11 @@
 
 #include "host_interfaces/framework/Guid.h"
 
-// Component ids by which the host creates what the plug-in registers.
+// Component ids by which the host creates what the plug-in registers, through its
+// component factory, between NCFStartup and NCFShutdown. A host begins with the
+// first (folders) and with the container (single files). The format, the lists and
+// the sample mapping are made by these two: only the module can give them the clip
+// that they need. No class factory serves CompID_QuickTimeClips.
 namespace NMA {
 
 inline constexpr GUID CompID_QuickTimeMediaVolume = ncfGuid("A0529DD3-C63D-45EA-AF2A-D962C0DFB5B5");
@@ -19,5 +23,6 @@ inline constexpr GUID CompID_QTParameters = ncfGuid("E01FB758-46AA-479F-BADA-1FB
 
 }  // namespace NMA
 
-// Component id of the handler that fills data containers from XML events.
+// Component id of the handler that fills data containers from XML events; the
+// module makes it for itself.
 inline constexpr GUID kCLSID_GenericDocHandler = ncfGuid("4E40C813-86AD-4275-92CC-3AAB04EB1689");

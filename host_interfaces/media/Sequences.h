@@ -6,18 +6,23 @@
 
 namespace NMA {
 
-// Lists of sequences; this family of media has none.
+// Lists of sequences; this family of media has none, so both interfaces are empty
+// for every host. Implemented by the module (QuickTimeSequences), which registers no
+// component for it: today nobody makes or calls one.
+
+// The sequences of a folder.
 struct ISequences : INCFUnknown {
-    virtual NCFRESULT GetSequenceCount() = 0;                               // 3: the value
-    virtual NCFRESULT GetSequence(ncfSInt32 index, INCFUnknown** out) = 0;  // 4
+    virtual NCFRESULT GetSequenceCount() = 0;                               // 3: the value, 0
+    virtual NCFRESULT GetSequence(ncfSInt32 index, INCFUnknown** out) = 0;  // 4. NCF_E_NOTIMPL
 
 protected:
     ~ISequences() = default;
 };
 
+// The same, each described as an in-memory AAF file.
 struct IAAFSequences : INCFUnknown {
-    virtual NCFRESULT GetAAFSequenceCount() = 0;                               // 3: the value
-    virtual NCFRESULT GetAAFSequence(ncfSInt32 index, INCFUnknown** out) = 0;  // 4
+    virtual NCFRESULT GetAAFSequenceCount() = 0;                               // 3: the value, 0
+    virtual NCFRESULT GetAAFSequence(ncfSInt32 index, INCFUnknown** out) = 0;  // 4. NCF_E_NOTIMPL
 
 protected:
     ~IAAFSequences() = default;

@@ -4,8 +4,8 @@
 
 #include "host_interfaces/framework/Definitions.h"
 
-// Names of what a clip's parameters are made of. All of them stand in documents
-// that users keep, so none ever changes.
+// Ids of what a clip's parameters are made of. Users keep documents that contain
+// them, so none ever changes.
 
 // The set that holds what the file itself says.
 inline constexpr GUID kParamSetDefault = ncfGuid("9F9FC555-4014-11C5-8FDE-5ED45EED7C03");

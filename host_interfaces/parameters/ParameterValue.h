@@ -4,16 +4,19 @@
 
 #include "host_interfaces/framework/Unknown.h"
 
-// One value of a parameter, for the journey between a module and a document. It
-// may be filled again and again; whoever is given one reads it during the call.
+// One value of a parameter, on its way between a module and a document.
+//
+// Implemented by the host, made by IValueFactory. The module fills one for the
+// suite, again and again; the host's reader fills one for a handler. Whoever is given
+// one reads it during the call. One thread at a time.
 struct IParameterValue : INCFUnknown {
     // 3. Holds nothing afterwards.
     virtual NCFRESULT Clear() = 0;
-    // 4. Takes `bytes` bytes of a value of a type, such as kValueTypeUInt32 with
-    // four bytes in machine order. The last argument is 0.
+    // 4. Copies `bytes` bytes of a value of a type, such as kValueTypeUInt32 with
+    // four bytes in machine order. `zero` is 0.
     virtual NCFRESULT SetData(const GUID& type, const void* data, ncfUInt32 bytes,
                               ncfUInt32 zero) = 0;
-    // 5. The first `bytes` bytes. When fewer are held: NCF_E_FAIL, and nothing is
+    // 5. Copies the first `bytes` bytes out. When fewer are held: NCF_E_FAIL, and nothing is
     // written.
     virtual NCFRESULT GetData(void* data, ncfUInt32 bytes) = 0;
 
@@ -21,7 +24,8 @@ protected:
     ~IParameterValue() = default;
 };
 
-// Makes values of the type by whose id the factory was created.
+// Makes values of one type. Implemented by the host as a component whose id is that
+// of the type; the module creates one where it needs a value, and lets go of it.
 struct IValueFactory : INCFUnknown {
     // 3. A new value that holds nothing, one reference for the caller.
     virtual NCFRESULT CreateValue(IParameterValue** out) = 0;

@@ -7,15 +7,20 @@
 
 namespace NMA {
 
-// Hears what stands in a parameter document. All that it is given is borrowed
-// for the call. A failure that it answers ends the reading.
+// Is told what a parameter document contains, in its order.
+//
+// Implemented by the module (QTParameters); the host's reader calls it during
+// IParametersReader::Parse, on the same thread. It borrows all that it is given. A
+// failure that it answers ends the reading.
 struct IParametersHandler : INCFUnknown {
-    virtual NCFRESULT BeginDocument() = 0;                        // 3
-    virtual NCFRESULT BeginComponent(const GUID& component) = 0;  // 4
-    // 5. Not 0: nothing of the component is left open.
+    virtual NCFRESULT BeginDocument() = 0;  // 3
+    // 4. Parameters of a component follow; a handler takes only its own.
+    virtual NCFRESULT BeginComponent(const GUID& component) = 0;
+    // 5. `isWhole` is not 0 when nothing of the component is left open.
     virtual NCFRESULT EndComponent(ncfUInt32 isWhole) = 0;
-    // 6. A set of the component. The state: 0, not the one in use; 1, in use; 2,
-    // in use, but its values are not for taking. The name may be null.
+    // 6. A set of the component begins. `state` is 0 when it is not the set in use,
+    // 1 when it is, 2 when it is but its values may not be taken over. The name may
+    // be null.
     virtual NCFRESULT BeginParamSet(const GUID& set, INCFString* name, float version,
                                     ncfUInt32 state) = 0;
     // 7. A value of the set begun last.
@@ -33,13 +38,17 @@ constexpr const GUID& ncfIdOf(const IParametersHandler*) {
 
 }  // namespace NMA
 
-// Reads a parameter document and tells a handler of it.
+// Reads a parameter document and tells a handler what it contains.
+//
+// Implemented by the host as a component; the module creates one for each document
+// that it is given. One thread at a time.
 struct IParametersReader : INCFUnknown {
-    // 3. Takes a reference; null takes none and lets go of the one before.
+    // 3. Keeps a reference to the handler and lets go of the one before; null only
+    // lets go.
     virtual NCFRESULT SetHandler(NMA::IParametersHandler* handler) = 0;
-    // 4. Reads the object's text, whatever the declaration in it claims. The
-    // events run during this call, and none of them when the document is no
-    // parameter document. The handler's failure is the result.
+    // 4. Reads the string's own text, whatever encoding is declared in it. The events
+    // come during this call; when the text is no sound parameter document, none
+    // comes. A failure that the handler answers is the result.
     virtual NCFRESULT Parse(INCFString* xml) = 0;
 
 protected:

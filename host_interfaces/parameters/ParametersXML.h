@@ -4,19 +4,25 @@
 
 #include "host_interfaces/framework/String.h"
 
-// The parameters of one clip, as documents. Strings are the caller's objects,
-// filled or read. NCF_E_INVALIDARG for a null string, NMA_E_NOTINITIALIZED for
-// parameters that belong to no clip.
+// The parameters of one clip, as XML documents.
+//
+// Implemented by the module (QTParameters). The host queries a sample mapping for
+// it; each query makes a new object, and all objects of a clip write the one record
+// that the clip keeps. The object keeps its mapping alive. Which threads may call:
+// SampleMapping.h. Strings are the caller's, and are filled or read during the call.
+// NCF_E_INVALIDARG for a null string, NMA_E_NOTINITIALIZED for parameters that belong
+// to no clip.
 struct INCFParametersXML : INCFUnknown {
-    virtual NCFRESULT GetParameterValuesXML(INCFString* xml) = 0;  // 3. What holds now.
-    // 4. The parameters with their choices, and what holds now.
+    virtual NCFRESULT GetParameterValuesXML(INCFString* xml) = 0;  // 3. The values in force.
+    // 4. The parameters with their choices, and the values in force.
     virtual NCFRESULT GetParameterDescriptionXML(INCFString* xml) = 0;
     virtual NCFRESULT GetDefaultValuesXML(INCFString* xml) = 0;  // 5. What the file says.
-    // 6. Takes over the values of the set in use. A failure half-way keeps those
-    // that were taken before it.
+    // 6. Takes over the values of the document's set in use. A failure half-way keeps
+    // the values that were taken before it. Formats that a mapping has keep their
+    // fields: whoever wants to see the change takes a new mapping.
     virtual NCFRESULT SetParameterValuesXML(INCFString* xml) = 0;
-    virtual NCFRESULT ParametersUnsupportedOperation(void*) = 0;  // 7. NCF_E_NOTIMPL
-    // 8. Back to the defaults. What depends on the values follows with the next
+    virtual NCFRESULT ParametersUnsupportedOperation(void* reserved) = 0;  // 7. NCF_E_NOTIMPL
+    // 8. Goes back to the defaults. What depends on the values follows with the next
     // values that are set.
     virtual NCFRESULT ResetParameters() = 0;
 

@@ -7,12 +7,18 @@
 
 namespace QuickTime {
 
-// Answers about the codec of a movie's picture. May be asked on several threads.
+// Answers about the codec of a movie's picture: what a mapping's formats are made
+// of, and a codec's name for a description.
+//
+// Implemented by the host as a component; the module creates one for a clip when it
+// first needs it. All mappings of the clip share it, so it may be asked on several
+// threads at once. 4, 6 and 7 need operation 3 before them.
 struct IQuickTimeProperty : INCFUnknown {
-    // 3. Opens the movie that the other operations speak of; may come again.
+    // 3. Opens the movie that the other operations speak of. May come again, for the
+    // same movie or another.
     virtual NCFRESULT CreateMovie(INCFString* path) = 0;
-    // 4. Codes of pixel formats, 32-bit numbers in the codec's order of
-    // preference; a new reference. A count of 0 is allowed.
+    // 4. Codes of pixel formats, `count` 32-bit numbers in the codec's order of
+    // preference. The caller owns the buffer. A count of 0 is allowed.
     virtual NCFRESULT GetCodecPixelFormats(INCFBuffer** codes, ncfUInt32* count) = 0;
     // 5. A person's name for the codec, assigned to the caller's string; empty
     // for a well-formed but unknown code, a failure for code 0 or unprintable

@@ -12,39 +12,53 @@ namespace QTWrapper {
 inline constexpr ncfUInt32 kAlphaCheckForImport = 0;  // what the container says
 inline constexpr ncfUInt32 kAlphaCheckForQTNMA = 1;   // the first decoded picture
 
-// A movie opened through the multimedia library. Tracks have the movie's own
-// ids, never 0. Until a movie is open every operation answers
-// NMA_E_NOTINITIALIZED, 0 or false. Outputs that may be null are skipped then.
+// A movie opened through the multimedia library: everything that a clip needs when
+// the header parser refuses its file, and the readers of every clip.
+//
+// Implemented by the host as a component. The module creates one for a clip when it
+// first needs it, calls NewMovieFromFilePath once, and then asks as it likes, until
+// the clip ends. One thread at a time: what asks one clip on several takes turns
+// (SampleMapping.h). Until a movie is open every operation answers
+// NMA_E_NOTINITIALIZED, 0 or false. Table and readers belong to the caller and
+// outlive the wrapper.
+//
+// Tracks have the movie's own ids, never 0. Flags are 0 or not. Outputs that may be
+// null are skipped then.
 struct IQuickTimeWrapper : INCFUnknown {
-    virtual NCFRESULT PreparePixelFormat(ncfUInt32 fourCC) = 0;       // 3
+    // 3. Whether the video reader knows a pixel format; NCF_E_NOTSUPPORTED if not.
+    virtual NCFRESULT PreparePixelFormat(ncfUInt32 fourCC) = 0;
     virtual NCFRESULT GetSampleTable(IQTWSampleTable** table) = 0;    // 4
-    virtual NCFRESULT GetQTAudioReader(IQTAudioReader** reader) = 0;  // 5
-    virtual NCFRESULT GetQTVideoReader(IQTVideoReader** reader) = 0;  // 6
-    // 7. bits: 1 top field first, 8 fields stored apart. NMA_E_FIELDS when the
-    // movie does not say.
+    virtual NCFRESULT GetQTAudioReader(IQTAudioReader** reader) = 0;  // 5. for all tracks
+    virtual NCFRESULT GetQTVideoReader(IQTVideoReader** reader) = 0;  // 6. of track 14
+    // 7. Whether a frame has two fields; `bits`: 1 top field first, 8 fields stored
+    // apart. NMA_E_FIELDS when the movie does not say.
     virtual NCFRESULT QueryVideoDescBufferDetails(ncfUInt32* interlaced, ncfUInt32* bits) = 0;
-    virtual NCFRESULT GetCodecColorSpaceInfo(ncfBool* found709, ncfBool* found601) = 0;  // 8
-    virtual ncfBool MovieHasOneFrame() = 0;                                              // 9
+    // 8. Which of the two matrices the picture names; neither is possible.
+    virtual NCFRESULT GetCodecColorSpaceInfo(ncfBool* found709, ncfBool* found601) = 0;
+    virtual ncfBool MovieHasOneFrame() = 0;                                     // 9
     virtual ncfUInt32 GetResolutionId(ncfUInt32 track) = 0;                     // 10. 0 = none
     virtual NCFRESULT GetCodecTypeName(ncfUInt32 track, INCFString* name) = 0;  // 11. assigned to
-    // 12. Each flag tells whether those tracks disagree with the length, which
-    // is in edit units of the rate.
+    // 12. Each flag tells whether the tracks of that kind disagree with the length,
+    // which is in edit units of the rate `rateNum` / `rateDen`, a second.
     virtual NCFRESULT MovieTrackDurationIssues(ncfSInt32 rateNum, ncfSInt32 rateDen,
                                                ncfUInt64 length, ncfBool* sound,
                                                ncfBool* picture) = 0;
-    virtual ncfBool MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) = 0;  // 13
+    virtual ncfBool MovieHasMultipleVideoTracks(ncfUInt32 reservedA,
+                                                ncfUInt32 reservedB) = 0;  // 13
     // 14. The one whose pictures the video reader delivers: the first of the file,
     // or of the lowest number where no clip can be made of the movie's header.
     virtual ncfBool GetFirstVideoTrack(ncfUInt32* track) = 0;
-    // 15. Fields in a frame, 1 or 2; false: unknown.
+    // 15. Fields in a frame, 1 or 2; 0 as the answer: unknown.
     virtual ncfBool GetFieldLayoutForTrack(ncfUInt32 track, ncfUInt32* fieldCount) = 0;
     // 16. Code of the sample description of any kind of track, four bytes in
     // text order.
     virtual NCFRESULT GetFourCCFromImageDescrptor(ncfUInt32 track, ncfUInt8* fourBytes) = 0;
-    virtual ncfUInt32 GetImageDescriptionCount(ncfUInt32 track) = 0;           // 17
-    virtual NCFRESULT MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) = 0;  // 18
-    // 19. Each output may be null. `formatID` is a code of the sound system,
-    // 'lpcm' for every linear kind. Bits are 0 for compressed sound.
+    virtual ncfUInt32 GetImageDescriptionCount(ncfUInt32 track) = 0;  // 17
+    // 18. `kind` is one of the two ways of looking above.
+    virtual NCFRESULT MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) = 0;
+    // 19. Each output may be null. `sampleRate` is in frames per second. `formatID`
+    // is a code of the sound system, 'lpcm' for every linear kind; `formatFlags` are
+    // that system's. Bits are 0 for compressed sound.
     virtual NCFRESULT GetAudioInfoForTrack(ncfUInt32 track, ncfUInt32* channels, double* sampleRate,
                                            ncfUInt32* formatID, ncfUInt32* formatFlags,
                                            ncfUInt32* bytesPerPacket, ncfUInt32* framesPerPacket,
@@ -54,11 +68,14 @@ struct IQuickTimeWrapper : INCFUnknown {
     // null.
     virtual NCFRESULT GetMovieBox(ncfUInt32* width, ncfUInt32* height, ncfUInt32* aspectNum,
                                   ncfUInt32* aspectDen) = 0;
-    virtual ncfUInt64 GetMovieCreationTime() = 0;    // 21. seconds from 1904 UTC
-    virtual ncfUInt32 GetDescribedTrackCount() = 0;  // 22
-    virtual ncfUInt32 MovieIsSelfContained(ncfUInt32, ncfUInt32,
-                                           ncfUInt32) = 0;  // 23. the low byte counts
-    // 24. drop is 0 or 1.
+    virtual ncfUInt64 GetMovieCreationTime() = 0;  // 21. seconds from 1904 UTC
+    // 22. How many numbers, from 1, operation 16 is asked for the content hash.
+    virtual ncfUInt32 GetDescribedTrackCount() = 0;
+    // 23. Only the low byte of the answer counts: not 0 when all media is in the
+    // file.
+    virtual ncfUInt32 MovieIsSelfContained(ncfUInt32 reservedA, ncfUInt32 reservedB,
+                                           ncfUInt32 reservedC) = 0;
+    // 24. As IQTParser::GetTimeCodeInfo, of one track.
     virtual NCFRESULT GetTimeCodeInfoForTrack(ncfUInt32 track, ncfUInt8* hours, ncfUInt8* minutes,
                                               ncfUInt8* seconds, ncfUInt8* frames,
                                               ncfUInt32* timeScale, ncfUInt32* frameDuration,
@@ -68,17 +85,21 @@ struct IQuickTimeWrapper : INCFUnknown {
     virtual ncfBool IsTimeCodeTrack(ncfUInt32 track) = 0;  // 27
     virtual ncfUInt32 GetNumberOfTracks() = 0;             // 28. highest track number
     virtual ncfBool MovieHasAudio() = 0;                   // 29
-    // 30. Opens the file at a borrowed path. A failure leaves no movie open.
+    // 30. Opens a file. A failure leaves no movie open.
     virtual NCFRESULT NewMovieFromFilePath(INCFString* path) = 0;
-    // 31. Rates of 0 mean not given. Entry i of the track lengths is track
-    // i + 1, in edit units.
+    // 31. The movie's edit rate, `num` / `den` a second, and its length in edit
+    // units. Rates that go in are in frames per second, 0 when not given; the forced
+    // one wins. `singleFrameDuration` is the length of a movie of one frame, in edit
+    // units. `trackLengths` has `trackLengthCount` entries: entry i is filled with
+    // the length of track i + 1, in edit units. `useMovieHeader` (not 0) takes the
+    // length from the header instead of from the tracks.
     virtual NCFRESULT DetermineMovieEditRateAndLength(double forcedRate, double editorRate,
                                                       ncfUInt32 singleFrameDuration, ncfSInt32* num,
                                                       ncfSInt32* den, ncfUInt64* length,
                                                       ncfUInt64* trackLengths,
                                                       ncfUInt32 trackLengthCount,
                                                       ncfBool useMovieHeader) = 0;
-    // 32. Any box will do: pictures come at their stored size.
+    // 32. A box in pixels. Any will do: pictures come at their stored size.
     virtual NCFRESULT QTWSetMovieBox(ncfSInt16 top, ncfSInt16 left, ncfSInt16 bottom,
                                      ncfSInt16 right) = 0;
     virtual NCFRESULT GetVendor(ncfUInt32 track, ncfUInt32* vendor) = 0;  // 33. 0: none

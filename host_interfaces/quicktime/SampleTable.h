@@ -16,11 +16,15 @@ enum QTWSamplePropertyFlags_t : ncfUInt32 {
 // Samples of every track of an open movie, in decode order, numbered from 1:
 // the whole media, edit list or not. A sample of 0 or above the count gives
 // NCF_E_INVALIDARG, an unknown track NCF_E_NOTFOUND; the output stays as it is.
-// Times are in media time units of the track.
+// Times are in media time units of the track, positions in bytes of the file.
+//
+// Implemented by the host, given out by IQuickTimeWrapper; the module takes it when
+// it loads a clip that the header parser refuses, and asks it for each question of a
+// sample mapping. One thread at a time.
 struct IQTWSampleTable : INCFUnknown {
     virtual NCFRESULT GetNumSamples(ncfUInt32 track, ncfUInt64* n) = 0;  // 3
-    virtual NCFRESULT GetDataOffset(ncfUInt32 track, ncfUInt64 sample,
-                                    ncfUInt64* position) = 0;  // 4
+    // 4. Place of the sample's first byte.
+    virtual NCFRESULT GetDataOffset(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* position) = 0;
     virtual NCFRESULT GetSampleFlags(ncfUInt32 track, ncfUInt64 sample,
                                      QTWSamplePropertyFlags_t* flags) = 0;  // 5
     // 6. First sample whose bytes do not follow the one before; count + 1 at
@@ -29,13 +33,15 @@ struct IQTWSampleTable : INCFUnknown {
                                                               ncfUInt64* next) = 0;
     virtual NCFRESULT GetDataSizePerSample(ncfUInt32 track, ncfUInt64 sample,
                                            ncfUInt32* bytes) = 0;  // 7
-    // 8. Relative to display order: the first presented picture has 0.
-    virtual NCFRESULT GetDisplayOffset(ncfUInt32 track, ncfUInt64 sample,
-                                       ncfSInt64* offset) = 0;  // 8
+    // 8. Presentation minus decode time, shifted so that the first presented picture
+    // has 0.
+    virtual NCFRESULT GetDisplayOffset(ncfUInt32 track, ncfUInt64 sample, ncfSInt64* offset) = 0;
     virtual NCFRESULT GetDecodeDuration(ncfUInt32 track, ncfUInt64 sample,
-                                        ncfSInt64* duration) = 0;         // 9
-    virtual ncfUInt32 GetMaxDataSize(ncfUInt32 track) = 0;                // 10
-    virtual ncfBool HasOutOfOrderFrameDependencies(ncfUInt32 track) = 0;  // 11
+                                        ncfSInt64* duration) = 0;  // 9
+    // 10. Bytes of the largest sample; 0 without samples or track.
+    virtual ncfUInt32 GetMaxDataSize(ncfUInt32 track) = 0;
+    // 11. Not 0 when any display offset is not 0.
+    virtual ncfBool HasOutOfOrderFrameDependencies(ncfUInt32 track) = 0;
 
 protected:
     ~IQTWSampleTable() = default;

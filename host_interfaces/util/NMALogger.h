@@ -6,7 +6,9 @@
 #include "host_interfaces/util/NMAUtilExport.h"
 
 // Line logger of the process. Levels in use: 1 errors, 4 unload, 8 details.
-// Works before NMAInitialize and after NMATerminate. Thread-safe.
+//
+// Implemented by the utility library, as everything in this folder; the module keeps
+// one for its life. Works before NMAInitialize and after NMATerminate. Thread-safe.
 class NMAUTIL_API NMALogger {
 public:
     NMALogger();
@@ -16,7 +18,7 @@ public:
 
     // Name that starts each line; UTF-8, copied.
     void SetName(const char* name);
-    // Writes one formatted line; texts are UTF-8.
+    // Writes one formatted line; texts are UTF-8, zero-terminated.
     void Write(ncfUInt32 level, const char* format, ...) NCF_PRINTF(3, 4);
 
 private:

@@ -8,7 +8,8 @@
 // Value class over texts of the host. It keeps its own text and makes a host
 // string only where one is handed out, so it works before NMAInitialize and
 // after NMATerminate too, but for CreateString. Nothing here throws; memory
-// that runs out leaves the text empty.
+// that runs out leaves the text empty. The module uses it for paths and texts of its
+// own. One object belongs to one thread at a time.
 class NMAUTIL_API NMAString {
 public:
     NMAString();

@@ -6,7 +6,14 @@
 #include "host_interfaces/util/NMALogger.h"
 #include "host_interfaces/util/NMAString.h"
 
-// Start and stop of the library. Not counted: each may come twice or alone.
+// Functions of the utility library, which is linked to the module and loaded with
+// it. The module calls them between NCFStartup and NCFShutdown, on any thread; they
+// keep nothing that they are given but the factory. A string that comes out belongs
+// to the caller.
+
+// Start and stop of the library: from the one to the other it keeps a reference to
+// the host's factory, by which it makes strings. The module's NCFStartup and
+// NCFShutdown call them. Not counted: each may come twice or alone.
 NMAUTIL_API NCFRESULT NMAInitialize(INCFComponentFactory* factory);
 NMAUTIL_API NCFRESULT NMATerminate();
 

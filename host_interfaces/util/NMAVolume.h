@@ -6,7 +6,8 @@
 #include "host_interfaces/util/NMAUtilExport.h"
 
 // One folder of a file system, for scans and for the identity of its volume.
-// A folder that can't be read has no files.
+// A folder that can't be read has no files. The module makes one for each question
+// about a folder. One object belongs to one thread at a time.
 class NMAUTIL_API NMAVolume {
 public:
     explicit NMAVolume(INCFString* folder);  // borrowed; null: the empty path
@@ -14,9 +15,10 @@ public:
     NMAVolume(const NMAVolume&) = delete;
     NMAVolume& operator=(const NMAVolume&) = delete;
 
-    // The first, the next name that matches `pattern` ("*.mov"): bare names of
-    // files and of links to files, in the order of the file system. The caller
-    // owns the reference; null at the end. Case follows the file system.
+    // The first, then each next name that matches `pattern` ("*.mov"): bare names
+    // of files and of links to files, in the order of the file system. The caller
+    // owns the string; null at the end. Case follows the file system. `handle`
+    // keeps the place between the calls: the first sets it.
     INCFString* GetFirstFile(const char* pattern, void*& handle);
     INCFString* GetNextFile(void*& handle);
 

@@ -4,9 +4,15 @@
 
 #include "host_interfaces/framework/String.h"
 
-// A document in memory, read once. Objects of the tree keep the document
-// alive. One object stands for each node while a reference to it lives, so
-// two roads to a node give equal IID_INCFUnknown pointers.
+// A document in memory, read once, as a tree of objects.
+//
+// Implemented by the host: the document as a component, the rest given out by it.
+// The module creates a document for each XML text inside a movie's sample
+// description and for each parameter document that its parameter model reads. One
+// thread at a time for a document and all of its nodes. What comes out belongs to
+// the caller, and a node keeps its document alive. One object stands for each node
+// while a reference to it lives, so two roads to a node give equal IID_INCFUnknown
+// pointers.
 
 struct IXmlAttributeList;
 
@@ -19,10 +25,11 @@ enum XmlNodeType : ncfUInt32 {
     kXmlOther = 5,
 };
 
-// Output strings are new references; 3, 4 and 7 return the value itself.
+// A node of any kind. 3, 4 and 7 return the value itself. Children and attributes
+// are counted from zero.
 struct IXmlNode : INCFUnknown {
-    virtual ncfBool HasAttributes() = 0;                              // 3
-    virtual ncfUInt32 GetType() = 0;                                  // 4
+    virtual ncfBool HasAttributes() = 0;                              // 3. not 0: yes
+    virtual ncfUInt32 GetType() = 0;                                  // 4. an XmlNodeType
     virtual NCFRESULT GetName(INCFString** name) = 0;                 // 5
     virtual NCFRESULT GetValue(INCFString** value) = 0;               // 6
     virtual ncfUInt32 GetChildCount() = 0;                            // 7
@@ -33,6 +40,7 @@ protected:
     ~IXmlNode() = default;
 };
 
+// The attributes of an element, in the order of the document.
 struct IXmlAttributeList : INCFUnknown {
     virtual ncfUInt32 GetCount() = 0;                                // 3
     virtual NCFRESULT GetItem(ncfUInt32 index, IXmlNode** out) = 0;  // 4
@@ -58,6 +66,7 @@ protected:
     ~IXmlAttribute() = default;
 };
 
+// The document itself: loaded once, then asked for its root.
 struct IXmlDocument : INCFUnknown {
     // 3. Reads a file. Not well-formed, with a document type declaration, or
     // deeper than 256 levels: a failure, and the document stays empty.

@@ -21,13 +21,13 @@ namespace {
 
 using host::DisplayPath;
 
-// Pins what the library would take from clock and chance; our own library has
-// it beside the published functions.
+// Fixes what the library would take from the clock or at random; our own library
+// exports this beside the published functions.
 using PinTimeFunction = HRESULT (*)(const aafTimeStamp_t* time, const aafUID_t* generation);
 
 constexpr aafUID_t kPinnedGeneration = ncfGuid("00000000-0000-0000-0000-000000000001");
 
-// The last sentence that the library says for a person, while this lives.
+// Keeps the last sentence that the library writes for people, while this lives.
 class LibrarySentence final : public IAAFDiagnosticOutput {
 public:
     explicit LibrarySentence(AAFSetDiagnosticOutputFunction set) : set_(set) {
@@ -62,7 +62,7 @@ private:
     std::string text_;
 };
 
-// A folder of our own, gone with what is in it.
+// A folder of our own, which is removed with its content.
 class ScratchFolder {
 public:
     ScratchFolder() : path_(std::filesystem::temp_directory_path() / "cliphost-XXXXXX") {
@@ -99,7 +99,8 @@ AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
     for (const char* const name :
          {"AAFFileOpenTransient", "AAFFileOpenExistingRead", "AAFFileOpenNewModifyEx"}) {
         if (!library_.Find(name)) {
-            throw Failure(kExitCaller, file, fmt::format("is no AAF library: it lacks {}", name),
+            throw Failure(kExitCaller, file,
+                          fmt::format("is not an AAF library: it lacks {}", name),
                           "name another with --aaf-library FILE");
         }
     }

@@ -39,15 +39,15 @@ std::uint64_t WantedCount(const AudioOptions& options, const SoundReader& sound)
     }
     const std::uint64_t left = sound.Count() - options.start;
     if (options.count && *options.count > left) {
-        Notice("cliphost: {}: the sound ends {} behind sample {}; what there is is written\n",
+        Notice("cliphost: {}: the sound ends {} after sample {}; it is written up to its end\n",
                DisplayPath(options.movie), Counted(left, "sample"), options.start);
     }
     return std::min(options.count.value_or(left), left);
 }
 
-// Writes a file of sound from its first sample that could be read on: silence in
-// place of what can't be read is held back until something follows it, so that
-// none of it is written where nothing does.
+// Writes a file of sound, which begins with the first sample that could be read.
+// Samples that can't be read become silence, which is held back until a readable
+// sample follows: without one, no silence is written.
 class SoundCopy {
 public:
     SoundCopy(SoundReader& sound, const MissingSound& missing,
@@ -112,8 +112,8 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
         }
         if (options.rate == 0) {
             throw Failure(kExitFile, options.movie,
-                          "its samples a second are not known, since the movie can't be described",
-                          alone.rate == 0 ? "give --rate, their number"
+                          "its sample rate is not known, because the movie can't be described",
+                          alone.rate == 0 ? "give it with --rate"
                                           : fmt::format("give --rate {}", alone.rate));
         }
         form.rate = options.rate;
@@ -121,7 +121,7 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     const std::vector<unsigned char> header = WavHeader(form, count);
     if (header.empty()) {
         throw Failure(kExitFile, options.movie,
-                      fmt::format("no WAV file holds sound of {} at {} Hz",
+                      fmt::format("a WAV file can't hold sound of {} at {} Hz",
                                   Counted(form.channels, "channel"), form.rate));
     }
     RefuseOutputOntoMovie(options.output, options.movie);
@@ -149,7 +149,7 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
                    Counted(count, "sample"), Counted(form.channels, "channel"), form.rate);
     }
     if (silent > 0) {
-        Notice("cliphost: {}: {}silence stands in place of {} of {}, which could not be read\n",
+        Notice("cliphost: {}: {}{} of {} could not be read and are silent\n",
                DisplayPath(options.movie), missing.Reason().empty() ? "" : missing.Reason() + "; ",
                silent, Counted(count, "sample"));
     }
@@ -163,18 +163,19 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status) {
         app.add_subcommand("audio", "Write the sound of a track as a WAV file of 24 bits");
     verb->footer(
         "Example: cliphost audio clip.mov --start 48000 --count 96000 -o piece.wav\n"
-        "A file past 4 GiB is an RF64, which WAV programs know.");
+        "A file of more than 4 GiB is written as RF64, which WAV programs read.");
     auto options = std::make_shared<AudioOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("--track", options->track, "Its number; the first sound when not given")
+    verb->add_option("--track", options->track,
+                     "Number of the track; without it, the first sound track")
         ->check(SmallWholeNumber());
     verb->add_option("--start", options->start, "The first sample, from 0")
         ->check(WholeNumber())
         ->capture_default_str();
-    verb->add_option("--count", options->count, "How many samples; all when not given")
+    verb->add_option("--count", options->count, "How many samples; without it, all")
         ->check(WholeNumber(1));
     verb->add_option("--rate", options->rate,
-                     "Samples a second of a movie that can't be described and so does not tell")
+                     "Samples a second, for a movie that can't be described")
         ->check(SmallWholeNumber(1));
     verb->add_option("-o,--output", options->output, "The WAV file, or - for standard output")
         ->required();

@@ -22,7 +22,7 @@ namespace {
 
 using host::DisplayPath;
 
-// Set that values of the command line stand in. It has no name of its own.
+// The set that takes the values of the command line. It has no name of its own.
 constexpr GUID kCommandLineSet = ncfGuid("4D7B2A90-51C8-4E3F-9C06-B1A87E25F31D");
 
 std::string Lower(std::string text) {
@@ -69,7 +69,7 @@ const host::ParameterInfo& FindParameter(const std::vector<host::ParameterInfo>&
         }
     }
     throw Failure(kExitCaller, "--set " + name,
-                  "the clip has no such parameter, but these:" +
+                  "the clip has no such parameter; it has these:" +
                       Listed(infos, [](const auto& info) { return info.name; }));
 }
 
@@ -94,7 +94,7 @@ ncfUInt32 FindValue(const host::ParameterInfo& info, const std::string& text) {
         return number;
     }
     throw Failure(kExitCaller, fmt::format("--set {}={}", info.name, text),
-                  found.empty() ? "there is no such choice" : "several choices begin so",
+                  found.empty() ? "there is no such choice" : "several choices begin with this",
                   "write one of these, or a number:" +
                       Listed(info.choices, [](const auto& choice) { return choice.text; }));
 }
@@ -174,7 +174,7 @@ std::vector<ClipParameter> ClipParameters::List() {
     return list;
 }
 
-// Of the description, which stands also for a set whose identifier is zero.
+// Of the description, which is used too for a set whose identifier is zero.
 std::string ClipParameters::SetName() {
     const host::ParameterTrack track = Read(ParameterXml::kDescription).second;
     const host::ParameterSet* const set = track.SetInUse();
@@ -199,7 +199,7 @@ void ClipParameters::Assign(const std::vector<std::string>& assignments) {
     for (const std::string& assignment : assignments) {
         const std::size_t equals = assignment.find('=');
         if (equals == std::string::npos) {
-            throw Failure(kExitCaller, "--set " + assignment, "it gives no value",
+            throw Failure(kExitCaller, "--set " + assignment, "the value is missing",
                           "write it as \"name=value\"");
         }
         const host::ParameterInfo& info = FindParameter(infos, assignment.substr(0, equals));
@@ -231,8 +231,8 @@ void ClipParameters::Apply(const std::string& xml, const std::filesystem::path& 
     std::string problem;
     if (host::ReadParameterDocument(xml, document, problem) >= 0 && !HoldsValues(document)) {
         Notice(
-            "cliphost: {}: no values for this clip are in use there, so none was "
-            "taken\n",
+            "cliphost: {}: no set in use there has values for this clip, so no value was "
+            "changed\n",
             DisplayPath(file));
     }
 }

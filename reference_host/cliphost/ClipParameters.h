@@ -18,7 +18,7 @@ namespace cliphost {
 // The documents that a clip's parameters give.
 enum class ParameterXml { kValues, kDescription, kDefaults };
 
-// One parameter with what holds now and what the file says.
+// One parameter with the value in force and the value of the file.
 struct ClipParameter {
     host::ParameterInfo info;
     std::optional<ncfUInt32> value;
@@ -26,9 +26,9 @@ struct ClipParameter {
 };
 
 // The parameters of one open movie, which the session must outlive. They belong
-// to the clip that all mappings of its container share. Formats that a mapping
-// has made stay as they were, so ask a new mapping for those that come of a
-// change. Everything here throws a Failure.
+// to the clip that all mappings of its container share. A change does not reach the
+// formats that a mapping already has: take a new mapping. Everything here throws a
+// Failure.
 class ClipParameters {
 public:
     // Over a sample mapping of its own.

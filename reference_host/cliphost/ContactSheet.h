@@ -6,7 +6,7 @@
 
 namespace cliphost {
 
-// A sheet of small pictures in rows.
+// A sheet of thumbnails in rows.
 class ContactSheet {
 public:
     // Cells of a size, so many in a row.

@@ -52,7 +52,7 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     const std::string ending = options.output.extension().string();
     if (!ending.empty() && ending != ".png") {
         throw Failure(kExitCaller, options.output,
-                      fmt::format("'{}' is no ending that is written", ending),
+                      fmt::format("a name that ends in '{}' can't be written", ending),
                       "give FILE.png, or - for standard output");
     }
     const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
@@ -108,23 +108,21 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
 
 void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
-        app.add_subcommand("contact",
-                           "Write a contact sheet: small pictures of frames all through "
-                           "a movie");
+        app.add_subcommand("contact", "Write a contact sheet: thumbnails from the whole movie");
     verb->footer(
         "Example: cliphost contact clip.mov -o sheet.png\n"
-        "With --use-alpha a checkerboard shows through what is transparent.");
+        "With --use-alpha transparent parts show a checkerboard.");
     auto options = std::make_shared<ContactOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
     verb->add_option("-o,--output", options->output, "The PNG file, or - for standard output")
         ->required();
-    verb->add_option("--frames", options->frames, "How many")
+    verb->add_option("--frames", options->frames, "How many frames")
         ->check(CLI::Range(1, 1000))
         ->capture_default_str();
     verb->add_option("--columns", options->columns, "Pictures in a row")
         ->check(CLI::Range(1, 100))
         ->capture_default_str();
-    verb->add_option("--width", options->width, "Of a picture, in pixels")
+    verb->add_option("--width", options->width, "Width of a picture, in pixels")
         ->check(CLI::Range(16, 2048))
         ->capture_default_str();
     options->turn.AddTo(*verb);

@@ -35,7 +35,7 @@ Problem ProblemWith(Session& session, const std::filesystem::path& movie, NCFRES
         problem = DataFileProblem(session);
         problem.isOfProgram = true;
         if (!problem) {
-            problem = {movie, "the module makes no description of it, and no more is known of why",
+            problem = {movie, "the module does not describe it, and does not say why",
                        "-vv shows what it logs"};
         }
         problem.route = way;

@@ -32,7 +32,7 @@ struct DescribeOptions {
     bool quiet = false;
 };
 
-// Describes all that the command line names; one bad movie stops nothing.
+// Describes all movies of the command line; a bad one does not stop the rest.
 class DescribeRun {
 public:
     DescribeRun(Session& session, const DescribeOptions& options)

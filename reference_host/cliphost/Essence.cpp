@@ -33,7 +33,7 @@ Essence::Essence(Session& session, std::filesystem::path movie, const ParameterO
     tracks_ = description.file ? ReadClipTracks(description.file.get()) : FindTracks();
 }
 
-// The description says better what is wrong with a file, where it failed too.
+// When the description failed as well, its reason is the better one.
 void Essence::Map(NMA::IMediaContainer3& container) {
     const NCFRESULT mapped = container.GetSampleMapping(map_.Out());
     const NCFRESULT provided = mapped < 0 ? mapped : host::Query(map_.get(), provider_);
@@ -42,8 +42,8 @@ void Essence::Map(NMA::IMediaContainer3& container) {
     }
 }
 
-// Without a description the tracks are known by which of the two providers
-// takes their numbers.
+// Without a description, a track's kind is found by asking which of the two
+// providers accepts its number.
 std::vector<ClipTrack> Essence::FindTracks() {
     std::vector<ClipTrack> tracks;
     host::Query(map_.get(), pictures_);
@@ -135,9 +135,9 @@ std::string Essence::TrackList() const {
                                  : "its tracks are " + list;
 }
 
-// The module keeps every picture track of a movie and tells the host of the
-// first alone. Behind a second one the sounds have other numbers on its two
-// sides, and a request for sound would reach a picture.
+// The module counts every picture track of a movie but describes only the first to
+// the host. So with a second picture track the two sides number sound tracks
+// differently, and a request for sound would reach a picture.
 Problem Essence::Obstacle(const ClipTrack& track) {
     ncfUInt32 count = 0;
     if (track.kind != TrackKind::Sound) {
@@ -147,7 +147,7 @@ Problem Essence::Obstacle(const ClipTrack& track) {
     if (result == NCF_E_INVALIDARG) {
         return {movie_,
                 fmt::format("track {}: the movie has more than one picture track, and the module "
-                            "counts the further ones before the sound, so this sound can't be "
+                            "counts all of them before the sound, so this sound can't be "
                             "delivered",
                             track.number),
                 "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c "
@@ -218,7 +218,7 @@ Essence OpenEssence(Session& session, const std::filesystem::path& movie,
     Essence essence(session, movie, parameters);
     if (essence.undescribed()) {
         TellProblem(essence.undescribed(), session.verbosity());
-        Notice("  what can be mapped is served all the same\n");
+        Notice("  what can be mapped is still delivered\n");
     } else {
         TellRoute(movie, session.verbosity());
     }

@@ -16,9 +16,9 @@ inline constexpr int kExitFine = 0;
 inline constexpr int kExitFile = 1;    // the file's fault
 inline constexpr int kExitCaller = 2;  // the caller's fault
 
-// Whose fault a problem with a file is: the caller's where the system does not
-// open it, such as for want of permission, where it is no file at all, and where
-// it belongs to the program; else that of what it holds.
+// Whose fault a problem with a file is. The caller's: the system does not open it,
+// for instance without permission, it is not a file, or it belongs to the program.
+// Otherwise its content is at fault.
 int StatusOf(const Problem& problem);
 
 // Ends a verb with what the user and programs are told. what() is the line.

@@ -47,18 +47,18 @@ Problem OutOfReach(const std::filesystem::path& path, int error) {
         return {path,
                 fmt::format("the folder {} can't be entered: {}", DisplayPath(part.parent_path()),
                             SystemText(error)),
-                "get the right to search it"};
+                "get permission to search it"};
     }
     if (error == ELOOP) {
         return {path, fmt::format("the link {} leads in a circle", DisplayPath(part)),
-                "make it lead to a file"};
+                "make it point to a file"};
     }
     if (error == ENOENT && IsLink(part)) {
         std::error_code ignored;
         return {path,
                 fmt::format("the link {} leads to {}, which is not there", DisplayPath(part),
                             DisplayPath(std::filesystem::read_symlink(part, ignored))),
-                "make it lead to a file that is there"};
+                "make it point to a file that is there"};
     }
     if (error == ENOENT && isOnTheWay) {
         return {path, fmt::format("there is no such file or folder, and no folder {}",
@@ -68,7 +68,7 @@ Problem OutOfReach(const std::filesystem::path& path, int error) {
         return {path, "there is no such file or folder"};
     }
     if (error == ENOTDIR) {
-        return {path, fmt::format("{} is no folder", DisplayPath(part.parent_path()))};
+        return {path, fmt::format("{} is not a folder", DisplayPath(part.parent_path()))};
     }
     return {path, SystemText(error)};
 }
@@ -76,8 +76,8 @@ Problem OutOfReach(const std::filesystem::path& path, int error) {
 const char* KindOf(mode_t mode) {
     return S_ISFIFO(mode)   ? "a pipe"
            : S_ISSOCK(mode) ? "a socket"
-           : S_ISBLK(mode)  ? "a device of blocks"
-                            : "a device of characters";
+           : S_ISBLK(mode)  ? "a block device"
+                            : "a character device";
 }
 
 }  // namespace
@@ -97,14 +97,14 @@ Problem WhyUnreadable(const std::filesystem::path& file) {
     }
     // A pipe would keep us waiting.
     if (!S_ISREG(info.st_mode)) {
-        return {file, fmt::format("this is no file but {}", KindOf(info.st_mode)),
-                S_ISSOCK(info.st_mode) ? "" : "copy what comes from it into a file"};
+        return {file, fmt::format("this is not a file but {}", KindOf(info.st_mode)),
+                S_ISSOCK(info.st_mode) ? "" : "copy what it delivers into a file"};
     }
     const int descriptor = open(file.c_str(), O_RDONLY | O_CLOEXEC);
     if (descriptor < 0) {
         const int error = errno;
         return {file, "the file can't be opened: " + SystemText(error),
-                error == EACCES ? "get the right to read it" : ""};
+                error == EACCES ? "get permission to read it" : ""};
     }
     char byte = 0;
     const ssize_t got = read(descriptor, &byte, 1);
@@ -127,12 +127,12 @@ Problem WhyUnlistable(const std::filesystem::path& folder) {
     if (!list) {
         const int error = errno;
         return {folder, "the folder can't be listed: " + SystemText(error),
-                error == EACCES ? "get the right to read it" : ""};
+                error == EACCES ? "get permission to read it" : ""};
     }
     closedir(list);
     if (access(folder.c_str(), X_OK) != 0) {
         return {folder, "the folder can't be entered: " + SystemText(errno),
-                "get the right to search it"};
+                "get permission to search it"};
     }
     return {};
 }

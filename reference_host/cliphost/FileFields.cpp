@@ -30,8 +30,9 @@ std::string Find(const Words (&words)[count], ncfUInt32 value) {
     return {};
 }
 
-// Parameters of which the file has its own, and the member that tells it. Any
-// number but a choice's leaves the file's in force; these two mean just that.
+// Parameters for which the file has a value of its own, and the member that has it.
+// A number that is not one of the choices leaves the file's value in force; these
+// two numbers mean just that.
 struct FilesOwn {
     GUID parameter;
     ncfUInt32 noChoice;

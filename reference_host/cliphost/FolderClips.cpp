@@ -136,10 +136,10 @@ Problem NotClaimed(const std::filesystem::path& folder) {
         }
     }
     if (movies.empty()) {
-        return {folder, "not claimed: no file there is named *.mov", {}};
+        return {folder, "not claimed: no file in it is named *.mov", {}};
     }
     return {folder,
-            fmt::format("not claimed: no file there is named *.mov, though it holds {} with {}: {}",
+            fmt::format("not claimed: no file in it is named *.mov, but it holds {} with {}: {}",
                         Counted(movies.size(), "movie"),
                         movies.size() == 1 ? "another ending" : "other endings", NamesOf(movies)),
             HowToName(movies)};
@@ -151,7 +151,7 @@ Problem LeftOut(const std::filesystem::path& folder, const OtherMovies& others) 
         return {};
     }
     return {folder,
-            fmt::format("{} {} left out, since the module takes *.mov alone: {}",
+            fmt::format("{} {} left out, because the module only takes *.mov: {}",
                         Counted(movies.size(), "movie"), movies.size() == 1 ? "is" : "are",
                         NamesOf(movies)),
             HowToName(movies)};

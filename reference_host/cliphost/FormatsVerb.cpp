@@ -19,7 +19,7 @@ using Json = nlohmann::ordered_json;
 
 constexpr ncfUInt32 kLittleEndian = 0x4132434C;  // 'A2CL'
 
-// The size of a buffer is told for the format at work alone, so each is set.
+// The module only tells the buffer size of the format that is set, so each is set.
 Json PictureFormat(Essence& essence, const ClipTrack& track, const ImageFormat& format) {
     NMA::IUncompressedImageProvider& pictures = essence.pictures();
     ncfUInt16 alignment = 0;

@@ -57,7 +57,7 @@ FrameRange ParseFrameRange(const std::string& text) {
                         (!hasEnd || ParseNumber(parts[1], end)) &&
                         (parts.size() < 3 || ParseNumber(parts[2], range.step)) && range.step > 0;
     if (!isGood || (hasEnd && end <= range.first)) {
-        throw Failure(kExitCaller, "--range " + text, "this is no range",
+        throw Failure(kExitCaller, "--range " + text, "this is not a range",
                       "write FIRST:END or FIRST:END:STEP, such as 0:25 for frames 0 to 24, or 100: "
                       "for all from 100 on");
     }

@@ -9,8 +9,8 @@
 
 namespace cliphost {
 
-// Frames that a command line names: from one on, up to another that is not
-// among them, each so many-th.
+// Frames that a command line names: from the first, included, to the end, excluded,
+// in steps.
 struct FrameRange {
     std::uint64_t first = 0;
     std::optional<std::uint64_t> end;  // none: to the last frame
@@ -27,7 +27,7 @@ FrameRange OneFrame(std::uint64_t frame);
 
 FrameRange ParseFrameRange(const std::string& text);
 
-// So many frames of a clip, spread evenly: from the middle of each part.
+// A number of frames spread evenly over a clip: the middle one of each equal part.
 std::vector<std::uint64_t> SpreadFrames(std::uint64_t frames, std::uint64_t wanted);
 
 }  // namespace cliphost

@@ -74,8 +74,8 @@ void FrameReader::Choose(const std::string& formatName) {
                   "it offers " + offered);
 }
 
-// Edits may show pictures twice, so only where there is one does the number of
-// samples end them: it is given for every frame that is asked for.
+// Edits may show pictures twice, so the number of samples only limits the frames of
+// a movie with one sample, which is delivered for every frame that is asked for.
 std::uint64_t FrameReader::MostFrames() const {
     ncfUInt64 samples = 0;
     const bool isOne =

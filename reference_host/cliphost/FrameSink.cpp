@@ -27,10 +27,11 @@ Picture WritePng(const std::filesystem::path& file, const FrameReader& reader,
     picture = Turned(std::move(picture), turn);
     const std::vector<unsigned char> png = ToPng(picture);
     if (png.empty()) {
-        throw Failure(kExitFile, file,
-                      fmt::format("a picture of {} x {} in the format {} can't be made a PNG file",
-                                  reader.width(), reader.height(), reader.layout().name),
-                      "take a .raw file");
+        throw Failure(
+            kExitFile, file,
+            fmt::format("a picture of {} x {} in the format {} can't be written as a PNG file",
+                        reader.width(), reader.height(), reader.layout().name),
+            "write a .raw file");
     }
     OutputFile output(file);
     output.Write(png.data(), png.size());
@@ -128,7 +129,8 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
                       "give a folder or a .raw file for a range");
     }
     if (!ending.empty()) {
-        throw Failure(kExitCaller, output, fmt::format("'{}' is no ending that is written", ending),
+        throw Failure(kExitCaller, output,
+                      fmt::format("a name that ends in '{}' can't be written", ending),
                       "give FILE.png, FILE.raw, a folder, or - for standard output");
     }
     return std::make_unique<FolderSink>(output, movie.stem(), turn);
@@ -141,8 +143,8 @@ std::string RawWords(const FrameReader& reader, const ClipTrack& track) {
     const char* const name = reader.layout().rawName;
     if (!name) {
         return words +
-               "\nFFmpeg has no name for this layout; take --format with another where "
-               "one is offered";
+               "\nFFmpeg has no name for this layout; choose another with --format, if one "
+               "is offered";
     }
     words += fmt::format("\nfor FFmpeg: -f rawvideo -pixel_format {} -video_size {}x{}", name,
                          reader.width(), reader.height());

@@ -32,7 +32,7 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
                                          const std::filesystem::path& movie, bool isOneFrame,
                                          const PictureTurn& turn);
 
-// What a program that reads raw frames has to be told: size, layout, rate.
+// What a program needs to read raw frames: size, layout, rate.
 std::string RawWords(const FrameReader& reader, const ClipTrack& track);
 
 }  // namespace cliphost

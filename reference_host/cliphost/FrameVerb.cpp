@@ -32,8 +32,8 @@ struct FrameOptions {
     ParameterOptions parameters;
 };
 
-// Writes the frames that the command line names; one that does not decode is
-// told and left out.
+// Writes the frames that the command line names; one that can't be decoded is
+// reported and skipped.
 class FrameRun {
 public:
     FrameRun(Essence& essence, const FrameOptions& options)
@@ -87,7 +87,7 @@ int FrameRun::Run() {
                                     options_.turn.TurnFor(options_.movie));
     if (sink->IsRaw() && options_.withAlpha) {
         throw Failure(kExitCaller, options_.output, "--with-alpha is for PNG files",
-                      "raw frames of the alpha are those of its own track, see `cliphost formats "
+                      "for raw frames of the alpha name its own track, see `cliphost formats "
                       "--use-alpha`");
     }
     if (sink->IsRaw()) {
@@ -139,26 +139,29 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
         "Example: cliphost frame clip.mov --range 0: -o - |\n"
         "           ffplay -f rawvideo -pixel_format uyvy422 -video_size 1920x1080 -framerate 25 "
         "-i -\n"
-        "Standard error tells the pixel format, size and rate of raw frames.");
+        "For raw frames, standard error shows pixel format, size and rate.");
     auto options = std::make_shared<FrameOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("--track", options->track, "Its number; the first picture when not given")
+    verb->add_option("--track", options->track,
+                     "Number of the track; without it, the first picture track")
         ->check(SmallWholeNumber());
-    auto* const frame = verb->add_option("--frame", options->frame, "Its number, from 0")
+    auto* const frame = verb->add_option("--frame", options->frame, "Number of the frame, from 0")
                             ->check(WholeNumber())
                             ->capture_default_str();
     verb->add_option("--range", options->range,
-                     "FIRST:END or FIRST:END:STEP; END is not among them, and may be left out")
+                     "FIRST:END or FIRST:END:STEP; END itself is not written, and may be left out")
         ->excludes(frame);
-    verb->add_option("--format", options->format,
-                     "A name or number that `cliphost formats` lists, or 'deepest'; the first that "
-                     "a picture can be made of when not given");
+    verb->add_option(
+        "--format", options->format,
+        "A name or number that `cliphost formats` lists, or 'deepest'; without it, the "
+        "first that a picture can be made of");
     verb->add_flag("--with-alpha", options->withAlpha,
-                   "Give the PNG pictures the alpha of the clip");
+                   "Write the clip's alpha into the PNG pictures");
     options->turn.AddTo(*verb);
-    verb->add_option("-o,--output", options->output,
-                     "FILE.png, FILE.raw, a folder for a PNG each, or - for raw frames on standard "
-                     "output")
+    verb->add_option(
+            "-o,--output", options->output,
+            "FILE.png, FILE.raw, a folder for one PNG per frame, or - for raw frames on standard "
+            "output")
         ->required();
     options->parameters.AddTo(*verb);
     verb->callback([&session, &status, options] {

@@ -14,7 +14,7 @@ constexpr ImageLayout kLayouts[] = {
     {"2vuy", kCbYCrY, kBytes, 0, PictureBytes::CbYCrY8, 2, 8,
      "8-bit Y'CbCr 4:2:2, bytes Cb Y Cr Y", "uyvy422"},
     {"v210", kCbYCrY, kV210, 0, PictureBytes::Unusable, 4, 10,
-     "10-bit Y'CbCr 4:2:2 by its label, other bytes in its memory: no picture is made of it", nullptr},
+     "labelled 10-bit Y'CbCr 4:2:2, but holds other bytes: no picture can be made of it", nullptr},
     {"bgra", kBGRA, kBytes, kFullRange, PictureBytes::Bgra8, 4, 8,
      "8-bit R'G'B' 4:4:4:4, bytes B G R A", "bgra"},
     {"bgra", kBGRA, kBytesFullRange, 0, PictureBytes::Bgra8, 4, 8,

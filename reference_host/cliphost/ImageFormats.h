@@ -45,7 +45,7 @@ inline constexpr ncfUInt32 kMerged = 256;  // frame layout
 inline constexpr ncfUInt32 kSplit = 512;
 }  // namespace format
 
-// How the bytes of a delivered picture lie.
+// The layout of the bytes of a delivered picture.
 enum class PictureBytes {
     CbYCrY8,
     Bgra8,
@@ -74,7 +74,7 @@ const ImageLayout* LayoutOf(const ImageFormat& format);
 bool IsUsable(const ImageFormat& format);
 // The layout's name, or its numbers.
 std::string NameOf(const ImageFormat& format);
-// Everything in words: "8-bit Y'CbCr 4:2:2 ..., Rec. 709, video range, ...".
+// A format for people: "8-bit Y'CbCr 4:2:2 ..., Rec. 709, video range, ...".
 std::string WordsFor(const ImageFormat& format);
 
 // All formats of a picture or alpha track. The result is the module's.

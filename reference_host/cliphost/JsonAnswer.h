@@ -11,9 +11,9 @@ namespace cliphost {
 // Prints what a verb answers to --json on standard output.
 void PrintJson(const nlohmann::ordered_json& answer);
 
-// Does a verb's work. With `json`, a failure of it is told on standard output as
-// well: `head`, which may name the movie or folder, and the problem. A verb that
-// answers with a list gives an empty one, which the problem goes into.
+// Does a verb's work. With `json`, its failure is also written to standard output:
+// `head`, which may name the movie or folder, and the problem. A verb that answers
+// with a list passes an empty one as `head`, to which the problem is added.
 template <class Work>
 void AnswerFailureToo(bool json, nlohmann::ordered_json head, const Work& work) {
     try {

@@ -8,13 +8,13 @@
 namespace cliphost {
 
 // A path as programs read it from --json: the path itself, or its file URL when
-// it holds bytes that are no UTF-8, which JSON has no place for. Every verb
-// takes either back.
+// it holds bytes that are not UTF-8, which JSON can't contain. Every verb accepts
+// both forms.
 std::string MachinePath(const std::filesystem::path& path);
 
 // What to say of it where --json is explained.
 inline constexpr char kJsonHelp[] =
-    "As JSON; a path that is no UTF-8 stands there as a file URL (file:///a%FF.mov), which every "
-    "verb takes in place of a path";
+    "As JSON; a path that is not UTF-8 is given as a file URL (file:///a%FF.mov), which every "
+    "verb accepts as a path";
 
 }  // namespace cliphost

@@ -10,7 +10,7 @@
 
 namespace cliphost {
 
-// The part of a track's sound that the file is too short for.
+// The part of a track's sound that is beyond the end of the file.
 class MissingSound {
 public:
     // `place`: among the sound tracks of the movie. `rate`: samples a second as

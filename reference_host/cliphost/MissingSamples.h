@@ -11,9 +11,9 @@
 
 namespace cliphost {
 
-// The samples of a track that the file is too short for, as its table numbers
-// them. They need not stand at its end: chunks may lie in any order. Samples that
-// the header puts into another file are none of them.
+// The samples of a track that are beyond the end of the file, by the numbers of its
+// table. They need not be the last ones: chunks may be stored in any order. Samples
+// that the header places in another file are not among them.
 class MissingSamples {
 public:
     // `place`: of the track in the file.

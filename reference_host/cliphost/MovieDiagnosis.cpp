@@ -33,7 +33,7 @@ constexpr const char* kCopyAgain = "copy the file again from where it came";
 
 constexpr const char* kTakeSoundOut =
     "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c copy SOUND.mov";
-constexpr const char* kNeedsKey = "only who holds the key can read them";
+constexpr const char* kNeedsKey = "only someone with the key can read them";
 constexpr const char* kConvert = "convert it with a program that knows this codec";
 constexpr const char* kSaveInOne =
     "save the movie with its media in one file, such as with ffmpeg -i FILE -c copy WHOLE.mov";
@@ -52,15 +52,15 @@ std::string SecondsWords(ncfUInt64 units, const Track& track) {
     return Counted(seconds, "second");
 }
 
-// How often the pictures of the first track follow each other, and what makes
-// that no rate where it is a single one.
+// Why the pictures of the first track give no frame rate, and which sample is the
+// reason when it is a single one.
 std::string RateWords(const HeaderReport& header) {
     const ncfUInt32 place = TracksOf(header, TrackKind::Picture).front();
     const Track& track = header.movie->tracks[place];
     const header_parser::SampleTimes& times = track.samples.Times();
-    const std::string words = fmt::format(
-        "track {} of the file: {} in {} come to no rate of frames", place + 1,
-        Counted(track.samples.Count(), "picture"), SecondsWords(track.mediaDuration, track));
+    const std::string words = fmt::format("track {} of the file: {} in {} give no frame rate",
+                                          place + 1, Counted(track.samples.Count(), "picture"),
+                                          SecondsWords(track.mediaDuration, track));
     if (track.samples.Count() < 2) {
         return words;
     }
@@ -69,8 +69,8 @@ std::string RateWords(const HeaderReport& header) {
     if (longest <= times.TotalDuration() - longest || track.toldMediaDuration >= longest) {
         return words;
     }
-    return fmt::format("{}: sample {} of its table alone lasts {}, 'mdhd' tells {} of all", words,
-                       sample, SecondsWords(longest, track),
+    return fmt::format("{}: by its table, sample {} alone lasts {}, but 'mdhd' gives {} for all",
+                       words, sample, SecondsWords(longest, track),
                        SecondsWords(track.toldMediaDuration, track));
 }
 
@@ -89,13 +89,13 @@ std::string SoundHint(const HeaderReport& header) {
     if (CountsPackets(track)) {
         return kTakeSoundOut;
     }
-    return fmt::format("the sound alone can be had: cliphost audio FILE --rate {:.0f} -o FILE.wav",
+    return fmt::format("extract the sound alone: cliphost audio FILE --rate {:.0f} -o FILE.wav",
                        track.sound.front().rate);
 }
 
 Problem WithoutRate(const std::filesystem::path& movie, const HeaderReport& header) {
     if (!header.movie || TracksOf(header, TrackKind::Picture).empty()) {
-        return {movie, "nothing tells its rate of frames"};
+        return {movie, "nothing in it tells its frame rate"};
     }
     return {movie, RateWords(header), SoundHint(header)};
 }
@@ -120,8 +120,8 @@ std::string WhatIsElsewhere(const HeaderReport& header, std::size_t place,
                                  ? *description < isHere.size() && !isHere[*description]
                                  : std::find(isHere.begin(), isHere.end(), false) != isHere.end();
     return isElsewhere ? fmt::format(
-                             "track {} of the file: its samples lie in another file, and "
-                             "none but this one is read",
+                             "track {} of the file: its samples are in another file, and "
+                             "only this one is read",
                              place + 1)
                        : std::string();
 }
@@ -157,7 +157,7 @@ std::string WhatIsTooLong(const HeaderReport& header) {
         const ncfUInt64 edits = header.movie->tracks[i].edits.Duration();
         if (edits > header.movie->duration) {
             return fmt::format(
-                "track {} of the file: its edits last {} of the movie, and the "
+                "track {} of the file: its edits last {} of the movie, but the "
                 "movie lasts {}",
                 i + 1, Counted(edits, "unit"), header.movie->duration);
         }
@@ -232,7 +232,7 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
     }
     if (HasSaid(notices, kNoLength)) {
         return {movie,
-                fmt::format("its length of {} in {} a second comes to no frame",
+                fmt::format("its length of {} at {} a second is less than a frame",
                             Counted(header.movie->duration, "unit"), header.movie->timeScale),
                 SoundHint(header)};
     }
@@ -240,7 +240,7 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
         return {movie, missing, kCopyAgain};
     }
     if (const std::string opening = host::OpenProblem(movie); !opening.empty()) {
-        return {movie, "the multimedia library, which decodes it, refuses it: " + opening};
+        return {movie, "the multimedia library, which has to decode it, refuses it: " + opening};
     }
     if (const std::string untimed = WhatIsUntimed(header); !untimed.empty()) {
         return {movie, untimed};
@@ -284,7 +284,7 @@ Problem OfSecondRoute(const std::filesystem::path& movie, const HeaderReport& he
                       const std::vector<std::string>& notices) {
     const header_parser::Refusal& refusal = header.refusal;
     const char* const found = HasSaid(notices, kNoTracks) ? "no picture and no sound is found in it"
-                              : HasSaid(notices, kNoRate) ? "nothing tells its rate of frames"
+                              : HasSaid(notices, kNoRate) ? "nothing in it tells its frame rate"
                               : HasSaid(notices, kNoLength) ? "no length is found in it"
                                                             : nullptr;
     Problem problem{movie, refusal.Sentence(), refusal.code == NMA_E_NODATA ? kCopyAgain : ""};
@@ -331,8 +331,8 @@ Problem OfSample(const HeaderReport& header, std::size_t place, TrackKind kind,
                      (host::IsEncrypted(one) ? " (encrypted)" : "");
         }
         return {{},
-                fmt::format("track {} of the file: its sample descriptions are of the codecs {}, "
-                            "and the multimedia library reads a track by one alone",
+                fmt::format("track {} of the file: its sample descriptions name the codecs {}, "
+                            "but the multimedia library reads one codec per track",
                             place + 1, names)};
     }
     return {};
@@ -429,9 +429,8 @@ Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& wh
     // What is only left to the library is nothing wrong.
     if (header.refusal && header.refusal.code != NCF_E_NOTSUPPORTED) {
         return because(
-            fmt::format(
-                "{}; the multimedia library, which reads it all the same, delivers no such {}",
-                header.refusal.Sentence(), ofSound ? "sound" : "picture"),
+            fmt::format("{}; the multimedia library can open it, but delivers no such {}",
+                        header.refusal.Sentence(), ofSound ? "sound" : "picture"),
             header.refusal.code == NMA_E_NODATA ? kCopyAgain : "");
     }
     return {};

@@ -12,10 +12,10 @@
 
 namespace cliphost {
 
-// Looks at a file that could not be described and says in a sentence what is
-// the matter with it and what would help. The module gives one code for all of
-// this; what it told the user meanwhile, the header parser and the bytes tell
-// more. There is no reason, only a route, where the file is not the cause.
+// Looks at a file that could not be described and says in a sentence what is wrong
+// with it and what would help. The module gives one code for all causes; its console
+// lines, the header parser and the bytes say more. When the file is not the cause
+// there is no reason, only a route.
 Problem DiagnoseMovie(const std::filesystem::path& movie,
                       const std::vector<std::string>& notices = {});
 
@@ -26,9 +26,9 @@ struct WhichTrack {
     std::size_t place = 0;
 };
 
-// Why the samples of a track don't become frames or sound: encrypted, of a codec
-// without decoder, or not in the file from the given sample on. There is no
-// reason where the decoder alone could tell.
+// Why the samples of a track can't be delivered: they are encrypted, there is no
+// decoder for their codec, or they are missing from the given sample on. No reason
+// when only decoding could show it.
 Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& which,
                         std::uint64_t sample = 0);
 

@@ -12,9 +12,9 @@
 
 namespace cliphost {
 
-// Prints lines on standard error; what a movie's texts may hold of controls is
-// shown escaped. An output that takes nothing, on a full disk, must not end what
-// is being done: there is nobody left to tell.
+// Prints lines on standard error; control characters from a movie's texts are
+// escaped. When standard error can't be written, as on a full disk, the program
+// goes on: there is nobody left to tell.
 template <class... Arguments>
 void Notice(fmt::format_string<Arguments...> form, Arguments&&... arguments) {
     const std::string text =

@@ -14,7 +14,8 @@
 namespace cliphost {
 namespace {
 
-// Slower, a frame outlasts what a timecode counts; faster, no camera is.
+// With a lower rate a frame would last longer than timecode can count; no camera
+// has a higher one.
 constexpr double kSlowest = 0.01;
 constexpr double kFastest = 10000.0;
 
@@ -47,7 +48,7 @@ CLI::Validator WholeNumber(std::uint64_t least, std::uint64_t most) {
             std::uint64_t number = 0;
             return ReadWhole(text, number) && number >= least && number <= most
                        ? std::string()
-                       : fmt::format("'{}' is no whole number from {} to {}", text, least, most);
+                       : fmt::format("'{}' is not a whole number from {} to {}", text, least, most);
         },
         "", "WholeNumber");
 }
@@ -64,7 +65,7 @@ CLI::Validator FrameRate() {
             return ReadWhole(text, rate) && rate >= kSlowest && rate <= kFastest
                        ? std::string()
                        : fmt::format(
-                             "'{}' is no number of frames a second from {} to {}; write "
+                             "'{}' is not a number of frames a second from {} to {}; write "
                              "it such as 25 or 23.976",
                              text, kSlowest, kFastest);
         },
@@ -74,7 +75,7 @@ CLI::Validator FrameRate() {
 void RefuseEmptyTexts(CLI::App& app) {
     const CLI::Validator isThere(
         [](std::string& text) {
-            return text.empty() ? std::string("an empty text is no value") : std::string();
+            return text.empty() ? std::string("an empty text is not a value") : std::string();
         },
         "", "NotEmpty");
     ForEachValueOption(app, [&](CLI::Option& option) { option.check(isThere); });

@@ -6,7 +6,7 @@
 
 namespace cliphost {
 
-// Checks of option values, in words that a user can follow.
+// Checks of option values, with sentences that a user can act on.
 
 // A whole number from `least` on that the option's number can hold.
 CLI::Validator WholeNumber(std::uint64_t least = 0,

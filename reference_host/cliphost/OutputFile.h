@@ -11,16 +11,16 @@
 
 namespace cliphost {
 
-// The program that read our standard output ended; no failure of ours.
+// The program that read our standard output has ended, which is not our failure.
 class ReaderGone : public std::runtime_error {
 public:
     ReaderGone() : std::runtime_error("the reader of the output has gone") {}
 };
 
-// A file that is there whole or not at all: it is written beside its place under
-// another name, and takes its place when it is finished. An object that ends
-// unfinished leaves nothing. What has no place of that kind is written as it
-// is: "-", which is standard output, and devices and pipes.
+// A file that appears complete or not at all: it is written under another name in
+// the same folder and renamed when it is finished. An object that ends unfinished
+// leaves nothing behind. What can't be renamed is written directly: "-", which is
+// standard output, and devices and pipes.
 class OutputFile {
 public:
     explicit OutputFile(std::filesystem::path path);  // throws a Failure

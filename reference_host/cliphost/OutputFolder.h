@@ -7,8 +7,8 @@
 
 namespace cliphost {
 
-// A folder for outputs. It is made with those on the way to it; what was made and
-// is still empty in the end goes again, so that a failed call leaves nothing.
+// A folder for outputs. It is made with its parents; folders that were made and are
+// still empty at the end are removed, so that a failed call leaves nothing.
 class OutputFolder {
 public:
     explicit OutputFolder(const std::filesystem::path& folder);  // throws a Failure

@@ -14,8 +14,8 @@ Problem NotWritten(const std::filesystem::path& output, int error);
 // The same of a folder that is to be there.
 Problem FolderNotMade(const std::filesystem::path& folder, int error);
 
-// The error number whose words a sentence of somebody else ends with; 0 when
-// these are no words of the system.
+// The error number whose system text another library's sentence ends with; 0 when
+// it ends with no such text.
 int SystemErrorIn(std::string_view sentence);
 
 }  // namespace cliphost

@@ -7,9 +7,9 @@
 
 namespace cliphost {
 
-// The text of a parameter document's file, as UTF-8. UTF-16 is known by its
-// mark; another encoding is refused, since the text alone reaches the module
-// and not what it claims of itself. Throws a Failure for the caller.
+// The text of a parameter document's file, as UTF-8. UTF-16 is recognised by its
+// byte order mark; other encodings are refused, because the module gets the text
+// alone and never its declared encoding. Throws a Failure for the caller.
 std::string ReadParameterFile(const std::filesystem::path& file);
 
 }  // namespace cliphost

@@ -35,8 +35,8 @@ const std::map<std::string, ParameterXml> kXml = {{"values", ParameterXml::kValu
 // The name of a set may come from any document.
 constexpr std::size_t kLongestName = 200;
 
-// All choices of a parameter, a star at the one in use. What is none of them
-// stands behind them.
+// All choices of a parameter, with a star at the one in use. A value that is not one
+// of the choices is printed after them.
 void PrintParameter(const ClipParameter& parameter, const FileFields& file) {
     const auto line = [&](const std::string& text, bool isUsed, bool isDefault) {
         fmt::print("    {} {}{}\n", isUsed ? '*' : ' ', text, isDefault ? " (default)" : "");

@@ -8,8 +8,8 @@
 namespace cliphost {
 namespace {
 
-// Numbers that were rounded on their way into a file are zero still: less than
-// two degrees off.
+// Numbers that were rounded when the file was written still count as zero: less
+// than two degrees off.
 bool IsNothingBeside(double small, double large) {
     return std::abs(small) * 32 < std::abs(large);
 }

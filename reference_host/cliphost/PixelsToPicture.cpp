@@ -28,8 +28,8 @@ void StoreRgb(double luma, double cb, double cr, const Weights& weights, std::ui
     to[2] = Rounded(255.0 * (y + b), 255.0);
 }
 
-// Chroma stands on the even pixels; between two of them lies their mean. An odd
-// last pixel comes without Cr of its own.
+// Even pixels have chroma; pixels between them get the mean of their neighbours. An
+// odd last pixel has no Cr of its own.
 void FromCbYCrY(const ImageFormat& format, const unsigned char* bytes, Picture& picture) {
     const Weights& weights = format.colorSpace == format::kRec709 ? kWeights709 : kWeights601;
     const int width = picture.width;

@@ -42,8 +42,8 @@ void PackLine(const Picture& picture, int line, std::vector<unsigned char>& to) 
     }
 }
 
-// The library leaves by a long jump when something fails: nothing here that
-// would have to be destroyed may live across it.
+// The library fails by a long jump, which runs no destructors: no object that needs
+// one may be alive across a call.
 bool WriteAll(png_structp png, png_infop info, const Picture& picture, int colorType,
               std::vector<unsigned char>& line) {
     if (setjmp(png_jmpbuf(png))) {

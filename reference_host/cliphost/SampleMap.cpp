@@ -16,7 +16,7 @@ struct Property {
 constexpr Property kProperties[] = {
     {1024, "stands alone"}, {2048, "needs one other"}, {4096, "needs two others"}};
 
-// Faults of one kind come in crowds; the first few tell.
+// One cause makes many faults; the first few show it.
 constexpr std::size_t kMostFaults = 8;
 
 void Tell(RunMap& map, std::string fault) {
@@ -27,8 +27,8 @@ void Tell(RunMap& map, std::string fault) {
     }
 }
 
-// Where a sample lies. Sound may have several samples in a packet, which have the
-// place of that.
+// Where a sample is. Sound may have several samples in a packet, which all have the
+// packet's place.
 struct Stored {
     std::uint64_t position = 0;
     std::uint64_t size = 0;
@@ -50,8 +50,8 @@ NCFRESULT ReadStored(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t sa
     return result;
 }
 
-// Goes over the samples of a run, which is the first of `samples` that are left to
-// measure, until their packets make up its bytes.
+// Adds up the samples of a run, the first of the `samples` that are left to measure,
+// until their packets have the bytes of the run.
 class RunMeasure {
 public:
     RunMeasure(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t samples, SampleRun& run)

@@ -25,8 +25,8 @@ struct MappedSample {
     std::int64_t contiguousSamples = 0;  // -1 is an answer too
     std::uint64_t contiguousBytes = 0;
 };
-// The result is the module's; a missing temporal offset is no failure. Who reads all
-// samples of a track hands its `offsets` in.
+// The result is the module's; a missing temporal offset is no failure. A caller that
+// reads all samples of a track passes its `offsets`.
 NCFRESULT ReadMappedSample(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t number,
                            MappedSample& sample, TemporalOffsets* offsets = nullptr);
 // "stands alone" and the like, the number itself when it is not known.

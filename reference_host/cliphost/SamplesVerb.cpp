@@ -27,8 +27,8 @@ struct SamplesOptions {
     bool json = false;
 };
 
-// Shows the maps of tracks: each sample of a picture, the runs of a sound, whose
-// samples are many and alike.
+// Shows the maps of tracks: each sample of a picture track, but only the runs of a
+// sound track, whose samples are many and alike.
 class SamplesRun {
 public:
     SamplesRun(Essence& essence, const SamplesOptions& options)
@@ -75,7 +75,7 @@ void SamplesRun::ShowSamples(const ClipTrack& track, std::uint64_t count, Json& 
     Progress progress("samples", static_cast<std::size_t>(count / kStep + 1));
     if (!options_.json) {
         fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", "sample", "position", "size",
-                   "offset", "properties", "bytes that follow each other");
+                   "offset", "properties", "contiguous bytes");
     }
     TemporalOffsets offsets(essence_.map(), track.number, [&] {
         return DisplayTimesOf(essence_.movie(), essence_.Which(track));
@@ -139,7 +139,7 @@ void SamplesRun::ShowSums(const ClipTrack& track, const RunMap& runs, Json& json
         fmt::print("  wrong: {}\n", fault);
     }
     if (runs.faults.empty()) {
-        fmt::print("  all of it lies inside the file, and the sums agree\n");
+        fmt::print("  all samples lie inside the file, and the totals agree\n");
     }
 }
 
@@ -206,16 +206,17 @@ int SamplesRun::Run() {
 
 void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
-        app.add_subcommand("samples", "Show where the samples of a movie lie in its file");
+        app.add_subcommand("samples", "Show where the samples of a movie are in its file");
     verb->footer(
         "Example: cliphost samples clip.mov --track 0 --json\n"
-        "Samples stand in the order of decoding; the offset says how many further on lies the one "
-        "that is\ndisplayed at this place. Sums that do not agree with the file give exit status "
-        "1.");
+        "Samples are listed in decode order. The offset says how many samples later in this "
+        "order the one\nis stored that is displayed at this place. Totals that do not agree with "
+        "the file give exit status 1.");
     auto options = std::make_shared<SamplesOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
-    verb->add_option("--track", options->track, "Only this one")->check(SmallWholeNumber());
-    verb->add_flag("--every", options->every, "Each sample of sound too, not its runs");
+    verb->add_option("--track", options->track, "Only the track of this number")
+        ->check(SmallWholeNumber());
+    verb->add_flag("--every", options->every, "List every sample of sound, not only its runs");
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {
         AnswerFailureToo(options->json, {{"movie", MachinePath(options->movie)}}, [&] {

@@ -128,7 +128,7 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
             PathForModule(*folder);  // that it is there, and can be named
             std::error_code ignored;
             if (!std::filesystem::is_directory(*folder, ignored)) {
-                throw Failure(kExitCaller, *folder, "is no folder",
+                throw Failure(kExitCaller, *folder, "is not a folder",
                               "`cliphost describe` takes single movies");
             }
             Session session(options);

@@ -49,7 +49,7 @@ private:
     host::PluginModule* plugin_ = nullptr;
 };
 
-// That a path holds a backslash of its own, which no system but Windows refuses.
+// The problem of a path whose names contain a backslash, as only Windows forbids.
 Problem BackslashProblem(const std::filesystem::path& path);
 
 // A path as the module wants it: absolute, with backslashes. Throws a Failure

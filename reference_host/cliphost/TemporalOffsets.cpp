@@ -13,9 +13,9 @@
 namespace cliphost {
 namespace {
 
-// So many steps the module may take for each sample.
+// The most steps that the module may take for each sample.
 constexpr std::int64_t kNear = 16;
-// So many samples may cost more before the tables are read, and as many to compare.
+// How many samples may cost more before the tables are read, and how many are compared.
 constexpr std::size_t kFarAnswers = 8;
 
 using Offsets = std::vector<std::optional<std::int64_t>>;

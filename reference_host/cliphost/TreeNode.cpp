@@ -28,9 +28,9 @@ nlohmann::ordered_json JsonOf(const TreeNode& node) {
     return json;
 }
 
-// A line for the title and one for each fact, however long: trees of one shape
-// have their facts on the same lines, and a change of one is a change of its line
-// alone. A part that is alone stands behind the name of its property.
+// A line for the title and one for each fact, however long. So trees of one shape
+// have their facts on the same lines, and when one fact changes only its line does.
+// A single part follows the name of its property.
 void Write(const TreeNode& node, int indent, const std::string& property, std::string& out) {
     const std::string margin(static_cast<std::size_t>(indent) * 2, ' ');
     out += fmt::format("{}{}{}\n", margin, property, node.title);

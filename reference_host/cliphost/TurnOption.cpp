@@ -6,8 +6,8 @@ namespace cliphost {
 
 void TurnOption::AddTo(CLI::App& verb) {
     verb.add_flag("--as-stored", asStored_,
-                  "Leave the pictures as they are stored; else they are turned by quarters and "
-                  "mirrored as the movie's display matrix says. Raw frames always are as stored");
+                  "Leave pictures as they are stored instead of rotating and mirroring them as "
+                  "the movie's display matrix says. Raw frames are always as stored");
 }
 
 PictureTurn TurnOption::TurnFor(const std::filesystem::path& movie) const {

@@ -20,9 +20,11 @@ void ShowTypes(Session& session, bool json) {
     host::Ref<NMA::IMediaContainer3> container;
     const NCFRESULT made = session.host().Create(NMA::CompID_QuickTimeContainer, container);
     if (made < 0) {
-        throw Failure(
-            kExitCaller,
-            Problem{{}, "the module gives no container, which knows its file types", {}, made});
+        throw Failure(kExitCaller,
+                      Problem{{},
+                              "the module makes no container, so its file types can't be asked for",
+                              {},
+                              made});
     }
     nlohmann::ordered_json list = nlohmann::ordered_json::array();
     const ncfUInt32 count = container->GetFileTypeCount();

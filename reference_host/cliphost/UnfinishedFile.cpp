@@ -15,8 +15,8 @@
 namespace cliphost {
 namespace {
 
-// A handler may touch neither the heap nor a lock, so the names lie in memory
-// that is always there. One file is written at a time; the rest is reserve.
+// A signal handler may use neither the heap nor a lock, so the names are in static
+// memory. One file is written at a time; the other entries are spare.
 struct Slot {
     std::atomic<bool> isTaken{false};
     std::atomic<bool> isNamed{false};
@@ -56,7 +56,7 @@ int TakeSlot(const std::string& name) {
     return -1;
 }
 
-// A chain of links that is longer goes in a circle.
+// A longer chain of links must be a loop.
 constexpr int kMostLinks = 40;
 
 // Where a file is to lie: behind links, which stay.

@@ -7,10 +7,10 @@
 
 namespace cliphost {
 
-// The name beside a file's place under which it is written until it is whole. A
-// link stays; what it leads to is the place.
-// What has not taken its place is removed: when the object ends, and when the
-// program is ended by a signal, such as an interrupt at the keyboard.
+// The temporary name in the same folder under which a file is written. A link stays
+// a link: the file that it points to is replaced.
+// A file that was not finished is removed: when the object ends, and when a signal
+// ends the program, such as an interrupt from the keyboard.
 class UnfinishedFile {
 public:
     explicit UnfinishedFile(const std::filesystem::path& place);

@@ -16,9 +16,9 @@ struct WavForm {
     unsigned FrameBytes() const { return channels * (bits / 8); }
 };
 
-// All that stands before the samples of a file of so many frames. A file whose
-// sizes do not fit 32 bits is an RF64, which has them in 64. Empty for a form
-// or a length that no file can have.
+// All bytes before the samples, for a file of so many frames. When its sizes do not
+// fit 32 bits it is an RF64, which has 64-bit sizes. Empty for a form or a length
+// that no file can have.
 std::vector<unsigned char> WavHeader(const WavForm& form, std::uint64_t frames);
 
 // A chunk has an even number of bytes; whether one more must follow these.

@@ -27,8 +27,8 @@ std::filesystem::path ProgramFolder(const char* name) {
     return (error ? std::filesystem::absolute(name) : program).parent_path();
 }
 
-// A stream that the caller closed would give its number to the next file that is
-// opened, and what is printed would go into that file.
+// If the caller closed a standard stream, the next file that is opened would get
+// its number, and what is printed would go into that file.
 void KeepStandardStreams() {
     for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
         if (fcntl(stream, F_GETFD) < 0) {
@@ -42,7 +42,7 @@ void Tell(const std::string& text) {
     cliphost::Notice("cliphost: {}\n", text);
 }
 
-// What was printed may be lost as late as here.
+// Printed text may get lost even here, when buffers are flushed.
 int OutputStatus(int error, int status) {
     if (error == 0 || error == EPIPE) {
         return status;  // a reader that went away has seen enough
@@ -67,7 +67,7 @@ std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
     std::string text = error.what();
     const std::vector<std::string> rest = app->remaining();
     if (app->get_subcommands().empty() && !rest.empty()) {
-        text = fmt::format("'{}' is no verb and no option", rest.front());
+        text = fmt::format("'{}' is neither a verb nor an option", rest.front());
     }
     return fmt::format("cliphost: {}\nRun with --help for more information.\n",
                        host::text::PrintableLines(text));
@@ -86,16 +86,15 @@ int Run(int argc, char** argv) {
     app.require_subcommand(1);
     app.fallthrough();
     app.footer(
-        "Exit status: 0, all is done; 1, a file is at fault, by what it holds; 2, the call is, "
-        "such "
-        "as by a\nwrong option, a file that is not there, or an output that can't be written. Of "
-        "several failures\nthe highest is given.");
+        "Exit status: 0, everything was done; 1, the content of a file is at fault; 2, the call "
+        "is at fault:\na wrong option, a file that does not exist, an output that can't be "
+        "written. Of several failures\nthe highest counts.");
     app.set_version_flag("--version", "cliphost 1.3.2");
     app.add_flag("-v", session.verbosity,
-                 "Console lines of the module on standard error; twice for its log too");
+                 "Show the module's console lines on standard error; -vv shows its log too");
     app.add_option("--plugin", session.plugin,
-                   "Another module file than the one beside the program");
-    app.add_option("--aaf-library", session.aafLibrary, "Another build of the AAF library");
+                   "Use this module file instead of the one beside the program");
+    app.add_option("--aaf-library", session.aafLibrary, "Use this build of the AAF library");
 
     double editorRate = 25.0;
     double forcedRate = 0.0;
@@ -108,7 +107,7 @@ int Run(int argc, char** argv) {
         ->capture_default_str()
         ->group(settings);
     auto* const forced = app.add_option("--forced-rate", forcedRate,
-                                        "Frames per second that clips take instead of their own")
+                                        "Frames per second to use instead of a clip's own")
                              ->check(FrameRate())
                              ->group(settings);
     app.add_option("--single-frame-duration", singleFrameDuration,

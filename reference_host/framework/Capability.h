@@ -9,7 +9,7 @@
 
 namespace host {
 
-// The host's word on which way of access it prefers; 0 until set.
+// Which way of access the host prefers; 0 until set.
 class Capability final : public Component<INCFCapability> {
 public:
     NCFRESULT GetValue(ncfUInt32* value) override;

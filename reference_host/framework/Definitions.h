@@ -10,7 +10,7 @@
 
 namespace host {
 
-// What a module said of itself, readable.
+// What a module said of itself, for reading.
 struct DefinitionAttribute {
     GUID id;
     GUID valueType;

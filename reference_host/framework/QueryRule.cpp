@@ -10,7 +10,7 @@
 namespace host {
 namespace {
 
-// Questions are many and rules rare: without one a flag is all that is read.
+// Queries are many and rules rare: without a rule only a flag is read.
 std::atomic<bool> isSet{false};
 std::mutex mutex;
 QueryRule current;

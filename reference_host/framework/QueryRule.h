@@ -8,8 +8,8 @@
 
 namespace host {
 
-// Sees every question for an interface of the host's objects before it is
-// answered; a negative result is its answer, as ComponentFactory's rule is for
+// Sees every query for an interface of the host's objects before it is answered; a
+// negative result becomes the answer, as with ComponentFactory's rule for
 // creations. `number` counts from 1 since the rule was set.
 using QueryRule = std::function<NCFRESULT(const GUID& iid, ncfUInt32 number)>;
 

@@ -8,7 +8,8 @@
 
 namespace header_parser {
 
-// A type for people, in quotes: what is no plain letter is given as its number.
+// A type for people, in quotes: characters that are not plain letters are shown as
+// numbers.
 std::string NameOf(ncfUInt32 type);
 std::string PlainNameOf(ncfUInt32 type);  // without the quotes
 

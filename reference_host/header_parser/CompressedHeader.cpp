@@ -19,7 +19,7 @@ namespace {
 
 constexpr ncfUInt64 kPiece = 256 * 1024;
 
-// Closes the inflater on every road.
+// Closes the inflater however the function ends.
 struct Inflater {
     z_stream stream{};
     bool isOpen = false;

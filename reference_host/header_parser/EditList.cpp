@@ -65,8 +65,8 @@ Verdict EditList::Read(const Atom& elst, const ParserLimits& limits) {
                                             edit.mediaTime));
         }
         if (edit.duration > static_cast<ncfUInt64>(kMaxTime) - duration_) {
-            return Broken(elst,
-                          fmt::format("edits 1 to {} last longer than {} in sum", i + 1, kMaxTime));
+            return Broken(
+                elst, fmt::format("edits 1 to {} last longer than {} in total", i + 1, kMaxTime));
         }
         duration_ += edit.duration;
         edits_.push_back(edit);

@@ -121,7 +121,7 @@ Verdict HeaderScanner::Walk(Range& range) {
     const ncfUInt32 shortSize = LoadU32(range.at);
     const ncfUInt32 type = LoadU32(range.at + 4);
     if (shortSize == 0 && type == 0) {
-        return At(cursor_, NoData("zeros stand where an atom should, before any movie header"));
+        return At(cursor_, NoData("zeros where an atom should begin, before any movie header"));
     }
     if (shortSize == 1 && range.Left() < 16) {
         return Want(cursor_, limits_.scanReadSize);
@@ -133,10 +133,10 @@ Verdict HeaderScanner::Walk(Range& range) {
     }
     if (BelongsToFragments(type)) {
         return At(cursor_,
-                  NotSupported(fmt::format("the movie is fragmented, as {} tells", NameOf(type))));
+                  NotSupported(fmt::format("the movie is fragmented, as {} shows", NameOf(type))));
     }
     if (++atomsSeen_ > limits_.maxTopLevelAtoms) {
-        return At(cursor_, TooMuch(fmt::format("more than {} atoms stand in front of the movie "
+        return At(cursor_, TooMuch(fmt::format("more than {} atoms come before the movie "
                                                "header",
                                                limits_.maxTopLevelAtoms)));
     }
@@ -165,26 +165,26 @@ Verdict HeaderScanner::Walk(Range& range) {
 // Behind other atoms, one of their sizes may have led astray.
 Verdict HeaderScanner::NoAtomHere(ncfUInt32 type) const {
     if (atomsSeen_ == 0) {
-        return At(
-            0, NotSupported(fmt::format("its first atom would be {}, which opens no movie of the "
-                                        "QuickTime family",
-                                        NameOf(type))));
+        return At(0, NotSupported(fmt::format("its first atom would be {}, and no movie of the "
+                                              "QuickTime family begins with that",
+                                              NameOf(type))));
     }
     return At(cursor_,
-              NotSupported(fmt::format("no atom begins where {} ends, which stands at byte {} and "
+              NotSupported(fmt::format("no atom begins where {} ends, which is at byte {} and "
                                        "claims {} bytes",
                                        NameOf(last_.type), last_.position, last_.size)));
 }
 
 Verdict HeaderScanner::Missing(ncfUInt64 fileSize) const {
     if (state_ != State::kWalk) {
-        return At(atomPosition_,
-                  NoData(state_ == State::kGatherToEnd
-                             ? fmt::format("'moov' reaches to the end of the file at byte {}, amid "
-                                           "an atom",
-                                           fileSize)
-                             : fmt::format("'moov' claims {} bytes, the file ends at byte {}",
-                                           atomSize_, fileSize)));
+        return At(
+            atomPosition_,
+            NoData(state_ == State::kGatherToEnd
+                       ? fmt::format("'moov' reaches to the end of the file at byte {}, in the "
+                                     "middle of an atom",
+                                     fileSize)
+                       : fmt::format("'moov' claims {} bytes, the file ends at byte {}", atomSize_,
+                                     fileSize)));
     }
     if (atomsSeen_ == 0) {
         return At(0,
@@ -193,7 +193,7 @@ Verdict HeaderScanner::Missing(ncfUInt64 fileSize) const {
     if (cursor_ < fileSize) {
         return At(cursor_,
                   NoData(fmt::format(
-                      "the file ends at byte {}, amid the head of an atom, before any movie header",
+                      "the file ends at byte {}, inside an atom's header, before any movie header",
                       fileSize)));
     }
     if (cursor_ > fileSize) {

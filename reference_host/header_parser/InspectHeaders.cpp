@@ -29,7 +29,7 @@ std::string HeaderReport::WhyOfNoUse() const {
     const VideoDescription& picture = first.video.front();
     return picture.width != 0 && picture.height != 0
                ? std::string()
-               : fmt::format("track {} of the file: {} tells a size of {} x {}",
+               : fmt::format("track {} of the file: {} gives a size of {} x {}",
                              pictures.front() + 1, NameOf(picture.codec), picture.width,
                              picture.height);
 }

@@ -67,7 +67,7 @@ Verdict SortParts(const ParserLimits& limits, Movie& movie, HeaderParts& parts) 
         } else if (atom.type == Code("trak")) {
             parts.tracks.push_back(atom);
         } else if (atom.type == Code("mvex")) {
-            verdict = NotSupported(atom, "the movie is fragmented, as 'mvex' tells");
+            verdict = NotSupported(atom, "the movie is fragmented, as 'mvex' shows");
         } else if (atom.type == Code("rmra")) {
             verdict = NotSupported(atom, "the movie only refers to other files, by 'rmra'");
         }
@@ -144,7 +144,7 @@ Verdict ReadMovie(HeaderBytes&& bytes, const ParserLimits& limits, Movie& movie)
         }
         channels += ChannelsOf(movie.tracks.back());
         if (channels > limits.maxSoundChannels) {
-            return TooMuch("the sounds of the movie have more than 1024 channels together");
+            return TooMuch("the sound tracks of the movie have more than 1024 channels in total");
         }
         movie.ofKind[static_cast<std::size_t>(movie.tracks.back().kind)].push_back(
             static_cast<ncfUInt32>(movie.tracks.size() - 1));

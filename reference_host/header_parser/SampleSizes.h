@@ -9,8 +9,8 @@
 
 namespace header_parser {
 
-// How sound that is stored in packets, or counted frame by frame with a size
-// of 1 in the table, really lies in its chunks.
+// How sound is really stored in its chunks when it comes in packets, or when the
+// table counts frames with a size of 1.
 struct PacketLayout {
     ncfUInt32 framesPerPacket = 1;
     ncfUInt32 bytesPerPacket = 0;  // 0: the table's sizes are true

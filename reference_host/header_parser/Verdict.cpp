@@ -32,7 +32,7 @@ Verdict ClaimsTooMany(const Atom& atom, ncfUInt64 entries, ncfUInt64 bytesLeft) 
 Verdict VerdictOn(const AtomList& atoms, const std::string& parent) {
     std::string reason;
     if (atoms.Broken() && atoms.BytesLeft() < 8) {
-        reason = fmt::format("{} ends with {} that are no atom", parent,
+        reason = fmt::format("{} ends with {} that are not an atom", parent,
                              Counted(atoms.BytesLeft(), "byte"));
     } else if (atoms.Broken() && atoms.ClaimedSize() > atoms.BytesLeft()) {
         reason = fmt::format("{} claims {} bytes, {} left in {}", NameOf(atoms.StoppedType()),
@@ -41,7 +41,7 @@ Verdict VerdictOn(const AtomList& atoms, const std::string& parent) {
         reason = fmt::format("{} in {} has the impossible size {}", NameOf(atoms.StoppedType()),
                              parent, atoms.ClaimedSize());
     } else if (atoms.Closed()) {
-        reason = fmt::format("zeros stand in {} where an atom should", parent);
+        reason = fmt::format("zeros in {} where an atom should begin", parent);
     } else {
         return Fine();
     }

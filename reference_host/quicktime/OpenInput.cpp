@@ -178,8 +178,8 @@ std::string FindFault(const AVFormatContext& input) {
 }  // namespace
 
 std::string TooManyChannels() {
-    return "the sounds of the movie have more than " + std::to_string(kMostChannelsOfMovie) +
-           " channels together";
+    return "the sound tracks of the movie have more than " + std::to_string(kMostChannelsOfMovie) +
+           " channels in total";
 }
 
 void CloseInput::operator()(AVFormatContext* context) const {

@@ -20,8 +20,8 @@ enum class InputView {
 // ever read: lists of other files, picture sequences and the like lead nowhere.
 InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::string& reason);
 
-// Of all sounds of a movie together, as the header parser has it, and what is said
-// of a movie that has more.
+// The most channels of all sound tracks of a movie together, the header parser's
+// limit too, and the sentence for a movie that has more.
 inline constexpr int kMostChannelsOfMovie = 1024;
 std::string TooManyChannels();
 

@@ -40,7 +40,7 @@ bool IsOfOtherKind(const AVCodecParameters& form) {
     return form.codec_tag != 0 && av_codec_get_id(tags, form.codec_tag) != AV_CODEC_ID_NONE;
 }
 
-// What a decoder says that does not take the description of its samples.
+// What a decoder says when it rejects the description of its samples.
 std::string OpeningProblem(const AVCodec& decoder, const AVCodecParameters& form) {
     AVCodecContext* context = avcodec_alloc_context3(&decoder);
     int result = context ? avcodec_parameters_to_context(context, &form) : AVERROR(ENOMEM);
@@ -66,12 +66,12 @@ CodecProblem ProblemOf(const AVStream& stream) {
         const std::string refused = OpeningProblem(*decoder, form);
         return refused.empty() ? CodecProblem()
                                : CodecProblem{track + "the decoder of its codec " + name +
-                                                  " does not take its description: " + refused,
+                                                  " rejects its description: " + refused,
                                               code};
     }
     if (IsOfOtherKind(form)) {
         return {track + "its handler calls it " + (isSound ? "sound" : "pictures") +
-                    ", its codec " + name + " is one of " + (isSound ? "pictures" : "sound"),
+                    ", but its codec " + name + " is for " + (isSound ? "pictures" : "sound"),
                 code};
     }
     const AVCodecDescriptor* const known = avcodec_descriptor_get(form.codec_id);

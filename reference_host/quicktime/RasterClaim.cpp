@@ -107,12 +107,12 @@ std::string FindImpossibleRaster(const std::filesystem::path& path, int stream) 
     const std::int64_t own = samples.own.Pixels();
     const bool isTooSmall = TellsLargePictures(form) && own > 0 && own < told.Pixels() / kMostTimes;
     if (isTooSmall || own > MostPixels(form)) {
-        return "the file tells pictures of " + told.Words() +
-               ", and its samples hold pictures of " + samples.own.Words();
+        return "the file claims pictures of " + told.Words() +
+               ", but its samples hold pictures of " + samples.own.Words();
     }
     if (TellsLargePictures(form) && own == 0 && samples.largest > 0 &&
         samples.largest < told.Pixels() / kMostPixelsOfAByte) {
-        return "the file tells pictures of " + told.Words() + ", which " +
+        return "the file claims pictures of " + told.Words() + ", which " +
                std::to_string(samples.largest) +
                " bytes, the largest of its first samples, can't hold";
     }

@@ -10,16 +10,15 @@
 
 namespace host {
 
-// A description of a few bytes can claim pictures of gigabytes. Those of 4096 x 4096
-// and below are taken as they are told; of larger ones the first samples must tell
-// the same.
+// A description of a few bytes can claim pictures of gigabytes. Sizes up to
+// 4096 x 4096 are believed; larger ones only when the first samples say the same.
 
 bool TellsLargePictures(const AVCodecParameters& form);
-// Whether a movie file tells them of any of its tracks, by a look at its header.
+// Whether the header of a movie file claims such a size for any of its tracks.
 bool TellsLargePictures(const std::filesystem::path& path);
 
-// The most pixels that a decoder may make a picture of, for a stream whose pictures
-// have the size that `form` tells.
+// The most pixels that a decoder may give a picture, for a stream whose pictures have
+// the size of `form`.
 std::int64_t MostPixels(const AVCodecParameters& form);
 
 // Why a stream's pictures can't have the size that the file tells, in a sentence;

@@ -12,8 +12,8 @@ extern "C" {
 namespace host {
 namespace {
 
-// Of two decoders the one that gives the same sound from wherever it starts: the
-// other carries what it rounds off from sample to sample.
+// Of two decoders, the one that gives the same sound wherever it starts: the other
+// carries its rounding errors from sample to sample.
 const AVCodec* DecoderFor(AVCodecID codec) {
     const char* const name = codec == AV_CODEC_ID_MP2   ? "mp2float"
                              : codec == AV_CODEC_ID_MP1 ? "mp1float"

@@ -9,10 +9,10 @@
 
 namespace host {
 
-// A decoder of one sound stream, behind a parser where packets hold several
-// blocks of which the decoder would see the first alone. It takes packets in a
-// row: a jump needs a new one, since some decoders carry on what a flush does not
-// make them forget.
+// A decoder of one sound stream. When packets hold several blocks, of which the
+// decoder would see only the first, a parser splits them. It takes packets in order:
+// a jump needs a new object, because some decoders keep state that a flush does not
+// clear.
 class SoundCodec {
 public:
     // Null where there is no decoder. `keepsPriming`: what the container says is

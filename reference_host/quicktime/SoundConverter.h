@@ -9,11 +9,11 @@
 
 namespace host {
 
-// Sound as whole numbers of 32 bits in the channels and at the rate that were
-// promised. Nearly always a decoder gives just these; where a stream changes
-// on the way, channels are mixed and the rate is converted. Rates that no stream
-// changes between are refused, and forms beyond the first few: each one more
-// costs memory and time.
+// Sound as 32-bit integers, with the channels and at the rate that were promised.
+// A decoder nearly always delivers just these; when a stream changes on the way,
+// channels are mixed and the rate is converted. Changes between rates that no real
+// stream has are refused, and so are more than a few forms: each one costs memory
+// and time.
 class SoundConverter {
 public:
     SoundConverter(int channels, int rate) : channels_(channels), rate_(rate) {}

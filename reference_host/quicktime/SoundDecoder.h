@@ -17,9 +17,9 @@
 
 namespace host {
 
-// Decodes one sound track by place: 0 is the first sample that the movie
-// presents, and what an edit leaves empty is silence. Channels and rate are
-// those of its form; what changes on the way is brought to them.
+// Decodes one sound track from any place: 0 is the first sample that the movie
+// presents, and empty edits are silence. Channels and rate are those of its form;
+// sound that changes on the way is converted to them.
 class SoundDecoder {
 public:
     // `hasWholeIndex`: the file is a movie whose own time begins at 0. Other

@@ -30,11 +30,11 @@ struct SoundForm {
 // make no sense.
 bool ReadSoundForm(const AVStream& stream, SoundForm& out);
 
-// All sound of a movie as it is delivered, by stream: channels and rate of
-// compressed sound are those that come out of its decoder. But where a movie's
-// header can be read by itself, as `hasWholeIndex` says, the rate is what it tells:
-// by the configuration of AAC, and by the fields of MPEG audio. Nobody could tell
-// of another who does not decode.
+// All sound of a movie as it is delivered, by stream: channels and rate of compressed
+// sound are those of its decoder. But when the header of the movie can be read by
+// itself, as `hasWholeIndex` says, the rate is the header's: from the configuration
+// of AAC, and from the fields of MPEG audio. A reader that does not decode can't know
+// any other.
 std::map<int, SoundForm> ReadSoundForms(const std::filesystem::path& path,
                                         const AVFormatContext& input, bool hasWholeIndex);
 

@@ -10,11 +10,11 @@
 
 namespace host {
 
-// Where the packets of a stream begin when their blocks are put behind each
-// other. A packet's time is rounded to the units of its container, and some
-// writers round each step alone, so that their times run away from the sound:
-// a block follows the one before unless the step between their times tells of
-// more than rounding.
+// Where the packets of a stream begin when their blocks follow each other. A packet's
+// time is rounded to the units of its container, and some writers round each step
+// by itself, so that their times drift away from the sound. So a block directly
+// follows the one before, unless their times are further apart than rounding
+// explains.
 class SoundPlaces {
 public:
     struct Packet {

@@ -9,14 +9,14 @@
 
 namespace host {
 
-// The multimedia library makes room for what a movie's tables count before it
-// looks whether the file holds it. A few bytes can count thousands of millions.
+// The multimedia library allocates memory for what a movie's tables count before it
+// checks whether the file is long enough. A few bytes can count billions of entries.
 
-// As many of a kind as any movie may claim: hours of film in another file.
+// What any movie may claim of a kind: enough for hours of film in another file.
 constexpr ncfUInt64 kClaimsAlwaysFine = 1u << 20;
 
-// Which table of a movie counts more than the file's bytes can stand for, in a
-// sentence; empty when none does, and for files of other families.
+// A sentence that names a table which counts more than the file's bytes can hold;
+// empty when there is none, and for files of other families.
 std::string FindImpossibleTable(const std::filesystem::path& path);
 
 }  // namespace host

@@ -13,9 +13,9 @@
 
 namespace host {
 
-// The wrapper's video reader. Each operation locks, so that the reader stays
-// whole. A frame takes three of them, and nothing keeps who shares the reader
-// from setting another pixel format between.
+// The wrapper's video reader. Each operation locks, so that the reader's state stays
+// consistent. But a frame takes three operations, and nothing prevents another user
+// of the reader from setting another pixel format between them.
 class VideoReader final : public Component<QTWrapper::IQTVideoReader> {
 public:
     // The first picture track, with the size in which pictures are delivered.

@@ -6,9 +6,9 @@
 
 namespace host::util {
 
-// An empty string that refuses every change, shown where the host made none:
-// a caller that passes it on gets a failure back, not a null pointer. One
-// object for the process, which references don't end.
+// An empty string that refuses every change. It stands in for a string that the host
+// failed to make: a caller that passes it on gets a failure and not a null pointer.
+// The process has one, and releasing it does not end it.
 INCFString* RefusingString();
 
 }  // namespace host::util

@@ -23,8 +23,8 @@ NCFRESULT Check(const std::string& bytes, const char* encoding) {
     return reader.Feed(bytes.data(), bytes.size(), true);
 }
 
-// Everything that stands in the document, white space between elements too:
-// what is read and written again must come out whole.
+// Keeps everything in the document, white space between elements too: what is read
+// and written again must be complete.
 constexpr unsigned kParse =
     pugi::parse_default | pugi::parse_ws_pcdata | pugi::parse_comments | pugi::parse_pi;
 

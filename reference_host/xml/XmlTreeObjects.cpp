@@ -12,8 +12,8 @@ namespace host {
 
 namespace {
 
-// Remembers the last place in a list of siblings, which has no index of its
-// own, so that asking for one after another costs one step each.
+// Remembers the last place in a list of siblings, which has no index, so that reading
+// one after another costs one step each.
 template <class Item>
 class Siblings {
 public:
@@ -53,8 +53,8 @@ private:
     std::optional<ncfUInt32> count_;
 };
 
-// Counting for the objects of a tree: the last reference goes under the tree's
-// lock, so no other road can find an object that is about to end.
+// Counts references to an object of a tree: the last one is released under the
+// tree's lock, so nobody can find an object that is about to end.
 template <class... Interfaces>
 class TreeObject : public Component<Interfaces...> {
 public:

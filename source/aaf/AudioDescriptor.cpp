@@ -56,7 +56,7 @@ struct SoundDescriptor {
     }
 };
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 NCFRESULT SoundDescriptor::Create() {

@@ -63,7 +63,7 @@ NCFRESULT AddBinColumnEntry(IAAFSmartPointer<IAAFMob> pMobMasterMob,
     return NCF_OK;
 }
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 void AddAspectRatioBinColumnEntry(IAAFSmartPointer<IAAFMob> pMobMasterMob,

@@ -66,7 +66,7 @@ void PutBox(const IAAFSmartPointer<IAAFClassDef>& pClassDef,
 
 }  // namespace
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 NCFRESULT InitializeNivoBoundsBoxType(IAAFSmartPointer<IAAFDictionary> pDictionary,

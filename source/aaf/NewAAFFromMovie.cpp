@@ -46,7 +46,7 @@ struct Description : ClipDescription {
     NCFRESULT FinishMasterMob();
 };
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 NCFRESULT Description::OpenFile() {

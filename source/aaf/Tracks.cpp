@@ -42,7 +42,7 @@ struct TrackMaker : ClipDescription {
     NCFRESULT AddSoundSlots();
 };
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 NCFRESULT TrackMaker::ReadTiming() {

@@ -122,7 +122,7 @@ NCFRESULT PictureDescriptor::ChooseRoad() {
     return NCF_OK;
 }
 
-// The statements below are logged by their own text when they fail.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 // clang-format off
 
 NCFRESULT PictureDescriptor::Create() {

@@ -6,7 +6,7 @@
 #include "source/plugin/ResultChecks.h"
 
 // clang-format off
-// The statements below are logged as they were first written.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 
 // A wrapper whose movie failed to open is kept: the movie is not tried again,
 // and the wrapper answers every question with a failure.

@@ -8,7 +8,7 @@
 #include "source/plugin/ResultChecks.h"
 
 // clang-format off
-// The statements below are logged as they were first written.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 
 NCFRESULT OtherClip::GetNumSamples(ncfUInt32 qtTrack, ncfUInt64* numSamples) {
     NCF_FUNCTION("OtherClip::GetNumSamples");

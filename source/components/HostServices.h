@@ -8,8 +8,8 @@
 
 namespace NMA::Impl {
 
-// What components take from the host unknown at the start of their life; both
-// throw an NCFRESULT.
+// What components take from the host unknown when they are made; both throw an
+// NCFRESULT.
 inline void TakeComponentFactory(INCFUnknown* host, NCFSmartPtr<INCFComponentFactory>& factory) {
     if (!host) {
         ThrowIfFailed(NCF_E_POINTER);

@@ -4,7 +4,7 @@
 
 namespace NMA::Impl {
 
-// What the scans of a folder look for. Its case follows the file system.
+// The names that scans of a folder look for. Case counts as in the file system.
 inline constexpr char kMoviePattern[] = "*.mov";
 
 }  // namespace NMA::Impl

@@ -9,7 +9,7 @@
 
 // All picture values of one video format: what a data-file record says about
 // the stored essence. Made by the caller and filled field by field by the
-// retriever; a default stays wherever the record is silent and may be so.
+// retriever; a value that the record may leave out, and does, keeps its default.
 struct AAFInfo {
     aafUID_t essenceContainerLabel = {
         0x060E2B34, 0x0401, 0x0101, {0x0E, 0x04, 0x04, 0x01, 0x02, 0x01, 0x01, 0x00}};

@@ -14,8 +14,8 @@
 //
 // Every question searches the entry anew: the data are small, and a descriptor
 // is made once for a clip. Results: NCF_E_NOTSUPPORTED when no entry fits,
-// NCF_E_PARAMETERNOTAVAILABLE when the entry is silent on the element; an
-// output then keeps its value.
+// NCF_E_PARAMETERNOTAVAILABLE when the entry lacks the element; an output then
+// keeps its value.
 class AAFInfoDataContainerReader2 {
 public:
     // The container is borrowed. The rate plays no part in the search.

@@ -9,9 +9,9 @@
 
 namespace NMA::Impl {
 
-// Passes the events of the host's parser on to a data container and stops what
-// the container throws at the border, but for what Attribute says. Made through
-// the component factory for one parse and released after it.
+// Passes the events of the host's parser to a data container. What the container
+// throws becomes a result; only Attribute lets through what is no result. Made
+// through the component factory for one parse and released after it.
 class GenericDocHandler final
     : public CNCFComponent<UTIL::INCFSaxDocumentHandler, UTIL::INCFSaxErrorHandler,
                            IGenericDocHandler> {

@@ -7,7 +7,7 @@
 #include "host_interfaces/framework/ResultCodes.h"
 #include "source/descriptor_data/XMLDataPropertyDescription.h"
 
-// A search that ended without a find: an answer, no failure.
+// The answer of a search that found nothing; not a failure.
 inline constexpr NCFRESULT kPropertyNotFound = 1;
 
 // One node of a tree: of the declared tree, or of an entry that was read. It

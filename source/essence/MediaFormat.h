@@ -7,7 +7,7 @@
 #include "source/plugin/PixelEnums.h"
 #include "source/plugin/Rational.h"
 
-// One way in which a track's samples can be had. Immutable once it is in a
+// One format in which a track's samples can be delivered. Immutable once it is in a
 // track's list.
 class MediaFormat {
 public:

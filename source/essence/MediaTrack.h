@@ -11,7 +11,7 @@
 using MediaFormatPtr = std::tr1::shared_ptr<MediaFormat>;
 
 // One track as the host sees it: the formats on offer, in the order in which
-// they were added, and the one at work. Shared by the sample mapping alone.
+// they were added, and the one that is set. Only the sample mapping holds it.
 class MediaTrack {
 public:
     enum Type : ncfUInt32 {

@@ -24,7 +24,7 @@ constexpr ncfUInt32 kAll = 0xFFFFFFFFu;
 }  // namespace
 
 // clang-format off
-// Statements are logged as they were first written.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 
 // The lock is held through decoding and conversion, so that the pixel format
 // told to the reader still holds when it reads.

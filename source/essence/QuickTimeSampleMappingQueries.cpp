@@ -52,7 +52,7 @@ bool IsBelow(ncfUInt64 left, ncfUInt64 right) {
 }  // namespace
 
 // clang-format off
-// Statements are logged as they were first written.
+// These texts are part of the log's format; where the code differs, _TEXT carries them.
 
 // --- tracks ------------------------------------------------------------------------
 

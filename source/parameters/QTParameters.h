@@ -11,8 +11,8 @@
 
 namespace NMA::Impl {
 
-// Lets the user correct what a movie says of its fields, and choose what becomes
-// of its levels. The sample mapping makes one for each query and attaches it;
+// Lets the user correct what a movie says of its fields, and choose whether its
+// levels are expanded or compressed. The sample mapping makes one for each query and attaches it;
 // the host owns it, and it keeps the mapping, and so the clip, alive.
 //
 // New values go straight into the clip's record. Documents are written and read

@@ -9,9 +9,9 @@
 #include <stdexcept>
 #include <string>
 
-// A folder of a test's own, gone with it. It lies where the system keeps
-// temporary files, no two have one name, and the name holds what a user's may
-// hold: a space, an accent, parentheses and both quotes.
+// A folder for one test, deleted with the object. It is where the system keeps
+// temporary files, each has a name of its own, and the name contains what a user's
+// may contain: a space, an accent, parentheses and both quotes.
 class TestFolder {
 public:
     TestFolder() {

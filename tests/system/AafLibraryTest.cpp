@@ -67,7 +67,8 @@ TEST_F(AafLibraryOption, RefusesALibraryThatLacksThePublishedFunctions) {
     const fs::path library = ProgramFolder() / "libNMAUtilLib20.so";
     const CommandResult run = RunCliphost("--aaf-library " + Quoted(library) + " plugin");
     EXPECT_EQ(run.status, 2);
-    EXPECT_NE(run.out.find("is no AAF library: it lacks AAFFileOpenTransient"), std::string::npos)
+    EXPECT_NE(run.out.find("is not an AAF library: it lacks AAFFileOpenTransient"),
+              std::string::npos)
         << run.out;
 }
 

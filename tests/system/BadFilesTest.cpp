@@ -86,7 +86,7 @@ TEST_F(BadFiles, UnreadableFileIsRefused) {
     const auto movie = Write(ReadFile(MadeMovie("png.mov")), "locked.mov");
     std::filesystem::permissions(movie, std::filesystem::perms::none);
     const std::string message = Refusal(movie, NCF_E_HANDLE);
-    EXPECT_TRUE(Says(message, "get the right to read it")) << message;
+    EXPECT_TRUE(Says(message, "get permission to read it")) << message;
 }
 
 TEST_F(BadFiles, AbsentFileIsTheCallersMistake) {

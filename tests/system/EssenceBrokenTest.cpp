@@ -1,8 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// Movies whose media are damaged or cut: one bad frame is one failure, and what
-// is there is served.
+// Movies whose media are damaged or cut: one bad frame is one failure, and everything
+// else is delivered.
 
 #include <algorithm>
 #include <fstream>
@@ -55,8 +55,8 @@ protected:
     }
 };
 
-// Nobody makes room for what the file can't hold, and every verb that gives or
-// promises pictures says why.
+// No memory is allocated for what the file can't hold, and every verb that delivers
+// or promises pictures says why.
 TEST_F(EssenceBroken, PicturesOfAFalseSizeAreNamedByEveryVerb) {
     const auto movie = folder() / "large.mov";
     for (const char* const encoder : {"mpeg4", "png", "rawvideo"}) {
@@ -76,7 +76,7 @@ TEST_F(EssenceBroken, PicturesOfAFalseSizeAreNamedByEveryVerb) {
         Write(bytes, movie.filename().string());
         const std::string reason =
             "cliphost: " + movie.string() +
-            ": track 1 of the file: the file tells pictures of 65535 x 65535, ";
+            ": track 1 of the file: the file claims pictures of 65535 x 65535, ";
         const std::string output = " -o " + Quoted(folder() / "a.png");
         for (const std::string verb : {"formats", "frame", "contact", "describe"}) {
             SCOPED_TRACE(verb);
@@ -278,8 +278,8 @@ TEST_F(EssenceBroken, SoundThatIsCutWithinABlockIsToldWithItsCount) {
                    "track 2 of the file: the file ends at byte " +
                        std::to_string(std::filesystem::file_size(cut)) + ", so samples ");
         ExpectSays(result, 1,
-                   "are missing or cut off; silence stands in place of " + std::to_string(silent) +
-                       " of 144000 samples");
+                   "are missing or cut off; " + std::to_string(silent) +
+                       " of 144000 samples could not be read and are silent");
         // In front of it nothing is amiss.
         const CommandResult front =
             RunCliphost("audio " + Quoted(cut) + " --count " + std::to_string(144000 - silent) +
@@ -289,7 +289,7 @@ TEST_F(EssenceBroken, SoundThatIsCutWithinABlockIsToldWithItsCount) {
         // One more is.
         ExpectSays(RunCliphost("audio " + Quoted(cut) + " --count " +
                                std::to_string(144001 - silent) + " -o " + Quoted(wav)),
-                   1, "silence stands in place of 1 of ");
+                   1, "off; 1 of ");
     }
 }
 

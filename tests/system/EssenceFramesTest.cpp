@@ -39,8 +39,8 @@ TEST_F(EssenceFrames, OfEightBits422AreTheDecodersBytes) {
     }
 }
 
-// D-10 codes the lines of the vertical interval above the picture; they are not
-// of the picture that the movie tells of.
+// D-10 codes the lines of the vertical interval above the picture; they are not part
+// of the picture that the movie describes.
 TEST_F(EssenceFrames, OfD10LeaveTheVerticalIntervalOut) {
     struct Interval {
         const char* name;

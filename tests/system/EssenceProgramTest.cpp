@@ -180,7 +180,8 @@ TEST_F(EssenceProgram, TellsWhatIsWrongWithACallAndLeavesNoFile) {
                "there is no track 1");
     ExpectSays(RunCliphost("frame " + movie + " --range 0:3 -o " + Out("a.png")), 2,
                "a PNG file holds one frame");
-    ExpectSays(RunCliphost("frame " + movie + " -o " + Out("a.jpg")), 2, "'.jpg' is no ending");
+    ExpectSays(RunCliphost("frame " + movie + " -o " + Out("a.jpg")), 2,
+               "ends in '.jpg' can't be written");
     ExpectSays(RunCliphost("frame " + movie + " -o " + movie), 2, "this is the movie itself");
     ExpectSays(RunCliphost("frame " + movie), 2, "--output is required");
     ExpectSays(RunCliphost("frame nothing.mov -o " + Out("a.png")), 2, "there is no such file");

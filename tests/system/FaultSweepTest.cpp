@@ -1,10 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// The whole road of a description, with its n-th call to the host refused for
-// every n: component creation, question for an interface, file read. Afterwards
-// the answer is a failure's code or a whole description, nothing is left
-// behind, and the road works again. The AAF operations have such a sweep in
+// A whole description, with its n-th call to the host refused for every n: component
+// creation, query for an interface, file read. The answer must be the failure's code
+// or a complete description, nothing may be left behind, and the next description
+// must work. The AAF operations have such a sweep in
 // tests/unit/aaf, where a library that fails can stand in.
 
 #include <algorithm>

@@ -30,7 +30,7 @@ TEST_F(FolderVerbs, TellHowManyMoviesAreNotClaimedAndHowToNameThem) {
     for (const char* const verb : {"describe ", "scan "}) {
         const CommandResult ran = RunCliphost(verb + In("in"));
         ExpectSays(ran, 1,
-                   "not claimed: no file there is named *.mov, though it holds 2 movies with other "
+                   "not claimed: no file in it is named *.mov, but it holds 2 movies with other "
                    "endings: B.MOV, clip.mp4; ");
         ExpectSays(ran, 1,
                    "rename each so that the name ends in .mov, in small letters, such as "
@@ -60,7 +60,8 @@ TEST_F(FolderVerbs, TellOfMoviesLeftOutBesideOthers) {
     Copy("in/a.mov");
     Copy("in/a.mp4");
     const std::string words =
-        "in: 1 movie is left out, since the module takes *.mov alone: a.mp4; rename it so that the "
+        "in: 1 movie is left out, because the module only takes *.mov: a.mp4; rename it so that "
+        "the "
         "name ends in .mov, in small letters, such as a.mp4.mov";
     ExpectSays(RunCliphost("describe -q " + In("in")), 0, words);
     ExpectSays(RunCliphost("scan " + In("in")), 0, words);
@@ -74,7 +75,7 @@ TEST_F(FolderVerbs, SayOnlyThatAFolderWithoutMoviesIsNotClaimed) {
     Write(movies::Bytes{'x'}, "notes.txt");
     for (const char* const verb : {"describe ", "scan "}) {
         ExpectSays(RunCliphost(verb + Quoted(folder())), 1,
-                   "not claimed: no file there is named *.mov\n");
+                   "not claimed: no file in it is named *.mov\n");
     }
 }
 
@@ -120,7 +121,7 @@ TEST_F(FolderVerbs, RefuseABackslashInAFoldersNameWhereverItComesFrom) {
 TEST_F(FolderVerbs, TellAFolderThatIsNotThereFromAFile) {
     ExpectSays(RunCliphost("scan " + In("no")), 2, "there is no such file or folder");
     Copy("a.mov");
-    ExpectSays(RunCliphost("scan " + In("a.mov")), 2, "is no folder");
+    ExpectSays(RunCliphost("scan " + In("a.mov")), 2, "is not a folder");
 }
 
 }  // namespace

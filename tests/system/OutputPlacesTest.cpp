@@ -146,7 +146,7 @@ TEST_F(OutputPlaces, ThatAreClosed) {
         }
         const AtEnd open("chattr -i " + In("closed"));
         ExpectRefused("closed/a",
-                      "Operation not permitted; get the right to write there or name "
+                      "Operation not permitted; get permission to write there or name "
                       "another place");
         return;
     }
@@ -154,7 +154,7 @@ TEST_F(OutputPlaces, ThatAreClosed) {
     std::filesystem::permissions(folder() / "closed", std::filesystem::perms::owner_read |
                                                           std::filesystem::perms::owner_exec);
     ExpectRefused("closed/a",
-                  "Permission denied; get the right to write there or name another place");
+                  "Permission denied; get permission to write there or name another place");
 }
 
 TEST_F(OutputPlaces, ThatHoldAFileWhichIsNotToBeChanged) {
@@ -167,8 +167,8 @@ TEST_F(OutputPlaces, ThatHoldAFileWhichIsNotToBeChanged) {
         }
         const AtEnd open((isRoot ? "chattr -i " : "chmod 600 ") + In(name));
         ExpectSays(RunCliphost(call.arguments + In(name)), 2,
-                   isRoot ? "not written: Operation not permitted; get the right to write there"
-                          : "not written: Permission denied; get the right to write there");
+                   isRoot ? "not written: Operation not permitted; get permission to write there"
+                          : "not written: Permission denied; get permission to write there");
         EXPECT_EQ(ReadFile(folder() / name), movies::Bytes{'k'});
     }
 }

@@ -122,14 +122,14 @@ TEST_F(ParamsVerb, TellsTheCallerWhatWasWrong) {
         int status;
         const char* words;
     } kCalls[] = {
-        {"--set 'Volume=11'", 2, "no such parameter, but these:\n    Field Ordering In File"},
+        {"--set 'Volume=11'", 2, "no such parameter; it has these:\n    Field Ordering In File"},
         {"--set 'Level Remapping=Louder'", 2, "no such choice; write one of these"},
         {"--set 'Level Remapping='", 2, "no such choice"},
-        {"--set 'Field Ordering=Interlaced'", 2, "several choices begin so"},
+        {"--set 'Field Ordering=Interlaced'", 2, "several choices begin with this"},
         {"--set 'Field Ordering'", 2, "name=value"},
         {"--set-xml /no/such/file.xml", 2, "there is no such file"},
         {"--set-xml " + Quoted(broken), 2, "1:16: no element found"},
-        {"--set-xml " + Quoted(other), 0, "none was taken"},
+        {"--set-xml " + Quoted(other), 0, "so no value was changed"},
         {"--xml everything", 2, "--xml"},
         {"--xml values --json", 2, "--json"},
     };

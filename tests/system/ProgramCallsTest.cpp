@@ -113,13 +113,13 @@ TEST_F(ProgramCalls, RefuseValuesThatMeanNothing) {
     };
     for (const char* const rate : {"nan", "inf", "0", "-1", "1e300", "x"}) {
         expectRefused("types --editor-rate " + std::string(rate),
-                      "is no number of frames a second");
+                      "is not a number of frames a second");
         expectRefused("types --forced-rate " + std::string(rate),
-                      "is no number of frames a second");
+                      "is not a number of frames a second");
     }
     for (const char* const number : {"-1", "18446744073709551616", "1.5", "nan"}) {
         const std::string text = number;
-        const std::string words = "'" + text + "' is no whole number";
+        const std::string words = "'" + text + "' is not a whole number";
         expectRefused("frame " + movie + " -o - --frame " + text, words);
         expectRefused("frame " + movie + " -o - --track " + text, words);
         expectRefused("audio " + movie + " -o - --start " + text, words);
@@ -137,8 +137,8 @@ TEST_F(ProgramCalls, RefuseValuesThatMeanNothing) {
         expectRefused("describe " + movie + " --pin-time " + time, "not a time");
     }
     EXPECT_EQ(RunCliphost("describe -q " + movie + " --pin-time 2024-02-29T23:59:59Z").status, 0);
-    expectRefused("contact " + movie + " -o " + Out("c.jpg"), "'.jpg' is no ending");
-    expectRefused("decribe " + movie, "'decribe' is no verb");
+    expectRefused("contact " + movie + " -o " + Out("c.jpg"), "ends in '.jpg' can't be written");
+    expectRefused("decribe " + movie, "'decribe' is neither a verb nor an option");
     EXPECT_EQ(FilesLeft(), 0u);
 }
 
@@ -151,7 +151,7 @@ TEST_F(ProgramCalls, RefuseEmptyTexts) {
           "frame " + movie + " -o - --range ''", "frame " + movie + " -o - --format ''",
           "params " + movie + " --set-xml ''", std::string("types --plugin ''"),
           std::string("types --aaf-library ''")}) {
-        ExpectSays(RunCliphost(call), 2, "an empty text is no value");
+        ExpectSays(RunCliphost(call), 2, "an empty text is not a value");
     }
 }
 
@@ -300,7 +300,7 @@ TEST_F(ProgramCalls, ShowNamesWithControlsEscaped) {
     ExpectSays(RunCliphost("describe -q " + Out("in")), 1, "/in/bad\\x1B.mov: ");
     ExpectSays(RunCliphost(Quoted("a\x1B"
                                   "b")),
-               2, "'a\\x1Bb' is no verb");
+               2, "'a\\x1Bb' is neither a verb nor an option");
 }
 
 TEST_F(ProgramCalls, LeaveNothingBehindWhenInterrupted) {

@@ -113,7 +113,8 @@ INSTANTIATE_TEST_SUITE_P(
                  return movies::Build(movie).ToBytes();
              },
              "describe -q",
-             "cliphost: a.mov: the sounds of the movie have more than 1024 channels together (at "
+             "cliphost: a.mov: the sound tracks of the movie have more than 1024 channels in total "
+             "(at "
              "byte 20)"},
         Case{"NoSamples",
              [] {
@@ -123,8 +124,8 @@ INSTANTIATE_TEST_SUITE_P(
              },
              "describe -q", "cliphost: a.mov: track 1 of the file: it holds no samples"},
         Case{"LongPictures", TwoLongPictures, "describe -q",
-             "cliphost: a.mov: track 1 of the file: 2 pictures in 7200 seconds come to no rate of "
-             "frames; the sound alone can be had: cliphost audio FILE --rate 48000 -o FILE.wav"},
+             "cliphost: a.mov: track 1 of the file: 2 pictures in 7200 seconds give no frame "
+             "rate; extract the sound alone: cliphost audio FILE --rate 48000 -o FILE.wav"},
         Case{"OneEndlessPicture",
              [] {
                  movies::Movie movie =
@@ -135,9 +136,9 @@ INSTANTIATE_TEST_SUITE_P(
                  return movies::Build(movie).ToBytes();
              },
              "describe -q",
-             "cliphost: a.mov: track 1 of the file: 30 pictures in 71582789 seconds come to no "
-             "rate of frames: sample 29 of its table alone lasts 71582788 seconds, 'mdhd' tells 1 "
-             "second of all"},
+             "cliphost: a.mov: track 1 of the file: 30 pictures in 71582789 seconds give no "
+             "frame rate: by its table, sample 29 alone lasts 71582788 seconds, but 'mdhd' gives 1 "
+             "second for all"},
         Case{"NoTimes",
              [] {
                  movies::Movie movie =
@@ -193,7 +194,7 @@ INSTANTIATE_TEST_SUITE_P(
         Case{"EncryptedPicture", [] { return WithCode(Made("png.mov"), "png ", "encv"); },
              "frame -o o.png",
              "cliphost: a.mov: track 1 of the file: its samples are encrypted "
-             "('encv'); only who holds the key can read them"},
+             "('encv'); only someone with the key can read them"},
         Case{"PictureWithoutDecoder", [] { return WithCode(Made("png.mov"), "png ", "xyz1"); },
              "frame -o o.png",
              "cliphost: a.mov: track 1 of the file: no decoder is known for its codec 'xyz1'; "
@@ -243,11 +244,11 @@ TEST_F(Reasons, TellWhereAWayEnds) {
     } const cases[] = {
         {"absent.mov", "there is no such file or folder"},
         {"no/folder/a.mov", "there is no such file or folder, and no folder " + at + "/no"},
-        {"file.mov/a.mov", at + "/file.mov is no folder"},
+        {"file.mov/a.mov", at + "/file.mov is not a folder"},
         {"dangling.mov", "the link " + at +
-                             "/dangling.mov leads to gone, which is not there; make it lead to a "
+                             "/dangling.mov leads to gone, which is not there; make it point to a "
                              "file that is there"},
-        {"loop.mov", "the link " + at + "/loop.mov leads in a circle; make it lead to a file"},
+        {"loop.mov", "the link " + at + "/loop.mov leads in a circle; make it point to a file"},
     };
     for (const auto& each : cases) {
         for (const char* const verb : {"describe", "formats", "samples", "audio -o o.wav"}) {
@@ -278,16 +279,16 @@ TEST_F(Reasons, TellWhatPermissionsForbid) {
         std::string words;
     } cases[] = {
         {0755, 0000, "describe in/a.mov",
-         "in/a.mov: the file can't be opened: Permission denied; get the right to read it"},
+         "in/a.mov: the file can't be opened: Permission denied; get permission to read it"},
         {0000, 0644, "describe in/a.mov",
          "in/a.mov: the folder " + in +
-             " can't be entered: Permission denied; get the right to search it"},
+             " can't be entered: Permission denied; get permission to search it"},
         {0111, 0644, "scan in",
-         "in: the folder can't be listed: Permission denied; get the right to read it"},
+         "in: the folder can't be listed: Permission denied; get permission to read it"},
         {0444, 0644, "scan in",
-         "in: the folder can't be entered: Permission denied; get the right to search it"},
+         "in: the folder can't be entered: Permission denied; get permission to search it"},
         {0444, 0644, "describe in",
-         "in: the folder can't be entered: Permission denied; get the right to search it"},
+         "in: the folder can't be entered: Permission denied; get permission to search it"},
     };
     for (const auto& each : cases) {
         std::filesystem::permissions(folder() / "in", std::filesystem::perms(0755));
@@ -344,7 +345,7 @@ TEST_F(Reasons, TellThatNoClipIsMadeOfAHeaderThatIsRead) {
     const Json entry = Json::parse(json.out);
     const Json& one = entry.is_array() ? entry[0] : entry;
     EXPECT_EQ(one["route"], "library");
-    EXPECT_EQ(one.value("routeReason", ""), "track 1 of the file: 'jpeg' tells a size of 0 x 48");
+    EXPECT_EQ(one.value("routeReason", ""), "track 1 of the file: 'jpeg' gives a size of 0 x 48");
 }
 
 // The library opens these, and makes no clip of them.
@@ -352,7 +353,7 @@ TEST_F(Reasons, KeepWhatTheHeaderParserSays) {
     Write(WithCode(Made("png.mov"), "stsd", "xxxx"), "a.mov");
     const CommandResult told = RunCliphost("describe -q " + In("a.mov"));
     ExpectSays(told, 1, "track 1: it lacks 'stsd', the sample descriptions (at byte ");
-    EXPECT_EQ(told.out.find("no more is known"), std::string::npos) << told.out;
+    EXPECT_EQ(told.out.find("does not say why"), std::string::npos) << told.out;
     EXPECT_EQ(told.out.find("no decoder"), std::string::npos) << told.out;
 }
 
@@ -367,7 +368,7 @@ TEST_F(Reasons, TellWhyATrackHasNoFrames) {
 TEST_F(Reasons, TellThatSoundIsEncryptedOrHasNoDecoder) {
     Write(WithCode(Made("pcm_s16be.mov"), "twos", "enca"), "a.mov");
     ExpectSays(RunCliphost("audio -o " + In("o.wav") + " " + In("a.mov")), 1,
-               "its samples are encrypted ('enca'); only who holds the key can read them");
+               "its samples are encrypted ('enca'); only someone with the key can read them");
     Write(WithCode(Made("pcm_s16be.mov"), "twos", "xyz1"), "b.mov");
     ExpectSays(RunCliphost("audio -o " + In("o.wav") + " " + In("b.mov")), 1,
                "no decoder is known for its codec 'xyz1'");
@@ -411,7 +412,7 @@ TEST_F(Reasons, TellOfLinksInAFolder) {
     const std::string words = "/in/a.mov leads to gone.mov, which is not there";
     const CommandResult alone = RunCliphost("scan " + In("in"));
     ExpectSays(alone, 1, words);
-    EXPECT_EQ(alone.out.find("no file there is named"), std::string::npos) << alone.out;
+    EXPECT_EQ(alone.out.find("no file in it is named"), std::string::npos) << alone.out;
     std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "in/b.mov");
     ExpectSays(RunCliphost("scan " + In("in")), 2, words);
     ExpectSays(RunCliphost("describe -q " + In("in")), 2, words);

@@ -271,7 +271,8 @@ TEST_F(SecondRoute, SaysInALineWhatNeitherWayOpens) {
     EXPECT_EQ(description.result, NMA_E_NOTINITIALIZED);
     const std::string line = LineOf(description.problem);
     EXPECT_EQ(line.find('\n'), std::string::npos) << line;
-    EXPECT_NE(line.find("which opens no movie of the QuickTime family"), std::string::npos) << line;
+    EXPECT_NE(line.find("and no movie of the QuickTime family begins with that"), std::string::npos)
+        << line;
     EXPECT_EQ(description.problem.code, NMA_E_NOTINITIALIZED);
     EXPECT_EQ(description.problem.route, cliphost::route::kNone);
 }

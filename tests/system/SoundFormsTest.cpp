@@ -561,8 +561,8 @@ TEST_F(SoundForms, ThatTakeMoreChannelsTogetherThanAreToldAreRefused) {
     const auto path = Write(movie, "many.mov");
     for (const char* const verb : {"describe ", "formats ", "samples "}) {
         ExpectSays(RunCliphost(verb + Quoted(path)), 1,
-                   "many.mov: the multimedia library, which decodes it, refuses it: the sounds of "
-                   "the movie have more than 1024 channels together");
+                   "many.mov: the multimedia library, which has to decode it, refuses it: the "
+                   "sound tracks of the movie have more than 1024 channels in total");
     }
 }
 

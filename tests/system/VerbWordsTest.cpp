@@ -35,7 +35,7 @@ TEST_F(VerbWords, CountOneChannelAndOneSample) {
     ExpectSays(RunCliphost("audio " + movie + " --start 1" + rate + Out("a.wav")), 2,
                "there is no sample 1 of sound; it has 1 sample, sample 0\n");
     ExpectSays(RunCliphost("audio " + movie + " --count 9" + rate + Out("a.wav")), 0,
-               "the sound ends 1 sample behind sample 0");
+               "the sound ends 1 sample after sample 0");
     ExpectSays(RunCliphost("frame " + movie + " -o " + Out("a.png")), 1,
                "it has no picture track; its one track is 0 (sound)\n");
 }

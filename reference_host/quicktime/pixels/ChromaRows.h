@@ -8,9 +8,8 @@
 
 namespace host {
 
-// From which two chroma lines a line of the picture takes its chroma, and how
-// much of the second. Lines of interlaced pictures take from their own field
-// alone.
+// From which two chroma lines a line of the picture takes its chroma, and how much
+// of the second. Lines of interlaced pictures only take it from their own field.
 struct ChromaLines {
     int first;
     int second;

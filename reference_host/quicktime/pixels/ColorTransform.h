@@ -8,7 +8,7 @@
 
 namespace host {
 
-// The way from the stored numbers of a picture to those of a layout.
+// Converts the stored numbers of a picture to those of a layout.
 struct ColorTransform {
     Affine affine;
     // Luma and chroma stay apart: chroma need not have the width of luma.

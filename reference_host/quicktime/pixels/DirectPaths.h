@@ -7,9 +7,9 @@
 
 namespace host {
 
-// Writes pictures whose numbers need no arithmetic, or next to none, which the
-// commonest codecs give. False when the picture is not such a one; nothing is
-// written then. The results equal those of the general way.
+// Writes pictures whose numbers need no arithmetic, or hardly any, as the commonest
+// codecs deliver them. False, with nothing written, for other pictures. The results
+// equal those of PictureWriter's general conversion.
 bool WriteDirectly(const AVFrame& frame, const PictureForm& form, PixelLayout layout,
                    std::uint8_t* to);
 

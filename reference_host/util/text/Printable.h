@@ -7,9 +7,9 @@
 
 namespace host::text {
 
-// What steers a terminal or ends a line in place of being shown: the control
-// characters, the ends of lines and paragraphs, and the marks that turn the
-// direction of writing.
+// Characters that control a terminal or end a line instead of being shown: control
+// characters, line and paragraph separators, and marks that change the direction of
+// writing.
 bool IsControl(char32_t c);
 
 // A foreign text for people, on one line. Controls, and bytes that are no UTF-8,

@@ -43,8 +43,8 @@ TEST(MovieDiagnosis, TellsFilesThatHoldNothing) {
     EXPECT_NE(DiagnoseMovie(folder.path()).reason.find("this is a folder"), std::string::npos);
     // One that nobody writes to would be waited for without end.
     ASSERT_EQ(mkfifo((folder / "pipe.mov").c_str(), 0600), 0);
-    EXPECT_EQ(DiagnoseMovie(folder / "pipe.mov").reason, "this is no file but a pipe");
-    EXPECT_EQ(DiagnoseMovie("/dev/null").reason, "this is no file but a device of characters");
+    EXPECT_EQ(DiagnoseMovie(folder / "pipe.mov").reason, "this is not a file but a pipe");
+    EXPECT_EQ(DiagnoseMovie("/dev/null").reason, "this is not a file but a character device");
     ExpectSays("", "the file is empty");
 }
 

@@ -23,7 +23,7 @@ TEST(OptionChecks, TakeWholeNumbersAlone) {
     EXPECT_EQ(Problem(check, "18446744073709551615"), "");
     for (const char* const text :
          {"-1", "18446744073709551616", "1.5", "nan", "abc", "", " 1", "1 ", "0x10", "+1"}) {
-        EXPECT_NE(Problem(check, text).find("is no whole number from 0 to"), std::string::npos)
+        EXPECT_NE(Problem(check, text).find("is not a whole number from 0 to"), std::string::npos)
             << text;
     }
     EXPECT_NE(Problem(cliphost::WholeNumber(1), "0"), "");

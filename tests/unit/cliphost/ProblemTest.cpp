@@ -46,8 +46,8 @@ TEST(Problem, TravelsInAFailure) {
     const Failure failure(kExitFile, kWhole);
     EXPECT_STREQ(failure.what(), "a.mov: it is broken at byte 12; copy it again");
     EXPECT_EQ(failure.problem().code, NMA_E_NODATA);
-    EXPECT_STREQ(Failure(kExitCaller, "--range x", "this is no range").what(),
-                 "--range x: this is no range");
+    EXPECT_STREQ(Failure(kExitCaller, "--range x", "this is not a range").what(),
+                 "--range x: this is not a range");
     EXPECT_STREQ(Failure(kExitCaller, "no memory").what(), "no memory");
 }
 

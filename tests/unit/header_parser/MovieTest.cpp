@@ -88,7 +88,8 @@ TEST(Movie, HasAtMost1024ChannelsOfSoundInAllItsTracks) {
     movie.tracks.push_back(movies::SoundTrack(sound, 10));
     const ParsedMovie parsed(movie);
     EXPECT_EQ(parsed.Result(), NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(parsed.Reason(), "the sounds of the movie have more than 1024 channels together");
+    EXPECT_EQ(parsed.Reason(),
+              "the sound tracks of the movie have more than 1024 channels in total");
 }
 
 TEST(Movie, WithoutTracksIsTakenWithNoneOfAnyKind) {

@@ -99,8 +99,9 @@ TEST(QTParser, KeepsAnsweringWithItsRefusal) {
     for (int i = 0; i < 2; ++i) {
         EXPECT_EQ(parser->ParseHeaders(bytes.data(), bytes.data() + 4096, 0), NCF_E_NOTSUPPORTED);
     }
-    EXPECT_EQ(parser->WhyRefused().reason,
-              "its first atom would be 'xxxx', which opens no movie of the QuickTime family");
+    EXPECT_EQ(
+        parser->WhyRefused().reason,
+        "its first atom would be 'xxxx', and no movie of the QuickTime family begins with that");
 }
 
 TEST(QTParser, RefusesAnotherRangeThanItAskedForAlsoForTimecode) {

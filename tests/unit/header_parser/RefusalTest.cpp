@@ -35,8 +35,8 @@ const std::map<std::string, Told> kTold = {
     {"mvhd_no_time_scale", {"moov/mvhd", "'mvhd' gives a time scale of 0 (at byte 3036)"}},
     {"mvhd_duration_of_33_bits",
      {"moov/mvhd", "the movie's duration of 4294967296 units does not fit 32 bits (at byte 3036)"}},
-    {"mvex", {"moov/mvex", "the movie is fragmented, as 'mvex' tells (at byte 3598)"}},
-    {"moof_in_front", {"", "the movie is fragmented, as 'moof' tells (at byte 12)"}},
+    {"mvex", {"moov/mvex", "the movie is fragmented, as 'mvex' shows (at byte 3598)"}},
+    {"moof_in_front", {"", "the movie is fragmented, as 'moof' shows (at byte 12)"}},
     {"reference_movie",
      {"moov/rmra", "the movie only refers to other files, by 'rmra' (at byte 8)"}},
     {"moov_empty", {"moov", "'moov' holds no 'mvhd' (at byte 12)"}},
@@ -55,16 +55,18 @@ const std::map<std::string, Told> kTold = {
     {"mdat_of_size_15_in_64_bits", {"", "'mdat' has the impossible size 15 (at byte 0)"}},
     {"sizes_wrap_around", {"", "'mdat' has the impossible size 9223372036854775807 (at byte 16)"}},
     {"only_ftyp", {"", "the file ends without 'moov', the movie header (at byte 12)"}},
-    {"zeros", {"", "zeros stand where an atom should, before any movie header (at byte 0)"}},
+    {"zeros", {"", "zeros where an atom should begin, before any movie header (at byte 0)"}},
     {"one_byte", {"", "the file holds 1 byte and no atom (at byte 0)"}},
     {"a_wave_file",
      {"",
-      "its first atom would be 'WAVE', which opens no movie of the QuickTime family (at byte 0)"}},
+      "its first atom would be 'WAVE', and no movie of the QuickTime family begins with that (at "
+      "byte 0)"}},
     {"text_that_looks_like_atoms",
      {"",
-      "its first atom would be 'aaaa', which opens no movie of the QuickTime family (at byte 0)"}},
+      "its first atom would be 'aaaa', and no movie of the QuickTime family begins with that (at "
+      "byte 0)"}},
     {"many_empty_atoms",
-     {"", "more than 65536 atoms stand in front of the movie header (at byte 524292)"}},
+     {"", "more than 65536 atoms come before the movie header (at byte 524292)"}},
     {"cmov_bomb",
      {"moov/cmov/cmvd",
       "the compressed movie header unpacks to more than 437800 bytes (at byte 3056)"}},
@@ -131,7 +133,7 @@ const std::map<std::string, Told> kTold = {
      {"moov/trak/edts/elst", "track 1: 'elst' is of the unknown version 3 (at byte 3252)"}},
     {"elst_durations_overflow",
      {"moov/trak/edts/elst",
-      "track 1: edits 1 to 1 last longer than 2305843009213693951 in sum (at byte 3252)"}},
+      "track 1: edits 1 to 1 last longer than 2305843009213693951 in total (at byte 3252)"}},
     {"elst_negative_media_time",
      {"moov/trak/edts/elst",
       "track 1: edit 1 begins at the impossible media time -2 (at byte 3252)"}},
@@ -146,7 +148,7 @@ const std::map<std::string, Told> kTold = {
       "track 1: 'free' claims 18446744073709551615 bytes, 16 left in 'stbl' (at byte 3598)"}},
     {"zeros_among_the_tables",
      {"moov/trak/mdia/minf/stbl",
-      "track 1: zeros stand in 'stbl' where an atom should (at byte 3598)"}},
+      "track 1: zeros in 'stbl' where an atom should begin (at byte 3598)"}},
     {"stts_missing",
      {"moov/trak", "track 1: it lacks 'stts', the sample durations (at byte 3144)"}},
     {"stts_claims_more_entries",
@@ -334,7 +336,7 @@ TEST(Refusal, TellsWhichAtomLedAstray) {
         Box("mdat").Text("0123456789\xFF\xFE\xFD\xFC").ClaimSize(14).ToBytes();
     bytes.insert(bytes.end(), media.begin(), media.end());
     EXPECT_EQ(WhyRefused(bytes).Sentence(),
-              "no atom begins where 'mdat' ends, which stands at byte 12 and claims 14 bytes (at "
+              "no atom begins where 'mdat' ends, which is at byte 12 and claims 14 bytes (at "
               "byte 26)");
 }
 

@@ -70,7 +70,8 @@ TEST(DecodedSound, OfAllTracksTogetherHasABound) {
             EXPECT_EQ(opened->SoundFormOf(1)->channels, 2u);
         } else {
             EXPECT_FALSE(opened);
-            EXPECT_EQ(reason, "the sounds of the movie have more than 1024 channels together");
+            EXPECT_EQ(reason,
+                      "the sound tracks of the movie have more than 1024 channels in total");
             EXPECT_EQ(host::OpenProblem(movie.Path()), reason);
         }
     }

@@ -57,7 +57,7 @@ TEST_P(EveryRaster, CantBeFarLargerThanTheSamplesHold) {
     NEEDS_FFMPEG();
     const MadeMovie retold = Retold(movie, 16384, 8640);
     const std::string claim = ClaimOf(retold);
-    EXPECT_EQ(claim.find("the file tells pictures of 16384 x 8640, "), 0u) << claim;
+    EXPECT_EQ(claim.find("the file claims pictures of 16384 x 8640, "), 0u) << claim;
     EXPECT_FALSE(host::PictureReader::Open(retold.Path(), 0, true));
 }
 
@@ -105,7 +105,7 @@ TEST(RasterClaim, IsABoundForTheDecoderToo) {
     const MadeMovie movie("-f lavfi -i color=s=4800x4800:r=25 -frames:v 1 -c:v mjpeg");
     const MadeMovie retold = Retold(movie, 64, 48);
     EXPECT_EQ(host::FindImpossibleRaster(retold.Path(), 0),
-              "the file tells pictures of 64 x 48, and its samples hold pictures of 4800 x 4800");
+              "the file claims pictures of 64 x 48, but its samples hold pictures of 4800 x 4800");
     const auto reader = host::PictureReader::Open(retold.Path(), 0, true);
     std::shared_ptr<const AVFrame> frame;
     ASSERT_TRUE(reader);

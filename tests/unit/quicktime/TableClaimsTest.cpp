@@ -191,7 +191,7 @@ TEST(OpenInputChannels, AreBoundedInSum) {
     movie.tracks.push_back(movies::SoundTrack(sound, 10));
     const MadeMovie file(movies::Build(movie).ToBytes(), ".mov");
     EXPECT_FALSE(host::OpenInput(file.Path(), host::InputView::AsPresented, reason));
-    EXPECT_EQ(reason, "the sounds of the movie have more than 1024 channels together");
+    EXPECT_EQ(reason, "the sound tracks of the movie have more than 1024 channels in total");
 }
 
 }  // namespace
