@@ -4,6 +4,7 @@
 // What is common to both kinds of clip, seen through the one that reads headers:
 // services made on first use, sound beside picture, names.
 
+#include "tests/support/fakes/StubClip.h"
 #include "tests/unit/clips/ClipFixture.h"
 #include "tests/unit/clips/FakeWrapper.h"
 
@@ -228,4 +229,32 @@ TEST_F(BaseClipSound, HandsItsFailuresOn) {
     EXPECT_EQ(log->count(ReturnRecord("a0000068", "GetMovieLength(&numVideoSamples)",
                                       "BaseClip::ObtainAudioTrackLength")),
               1);
+}
+
+// --- size and ratio ---------------------------------------------------------------------
+
+namespace {
+
+// Finds neither size nor ratio and doesn't say so.
+class SizelessClip : public StubClip {
+    NCFRESULT GetEncodedWidthAndHeightImpl(ncfUInt32*, ncfUInt32*) override { return NCF_OK; }
+    NCFRESULT GetImageAspectRatioImpl(ncfUInt32*, ncfUInt32*) override { return NCF_OK; }
+};
+
+}  // namespace
+
+TEST(BaseClip, TellsAMissingSizeFromAMissingRatio) {
+    FakeHost host;
+    const RecordingLog log(host);
+    SizelessClip clip;
+    ncfUInt32 a = 7;
+    ncfUInt32 b = 7;
+    EXPECT_EQ(clip.GetEncodedWidthAndHeight(&a, &b), NCF_E_FAIL);
+    EXPECT_EQ(log.count("NCFASSERT( width_ && height_ )BaseClip::GetEncodedWidthAndHeight"), 1);
+    const std::size_t before = log.records().size();
+    EXPECT_EQ(clip.GetImageAspectRatio(&a, &b), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(log.records().size(), before + 1) << "no more than the ratio that was found";
+    EXPECT_EQ(log.records().back().text, "BaseClip::GetImageAspectRatioimage_aspect_ratio: 0/0");
+    EXPECT_EQ(a, 7u);
+    EXPECT_EQ(b, 7u);
 }
