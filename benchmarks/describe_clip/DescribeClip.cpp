@@ -16,6 +16,7 @@
 #include <memory>
 
 #include "benchmarks/header_parser/LongMovie.h"
+#include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/cliphost/Describe.h"
@@ -101,17 +102,17 @@ void Ffprobe(benchmark::State& state) {
 
 BENCHMARK(Describe)
     ->RangeMultiplier(10)
-    ->Range(100, 10000000)
+    ->Range(100, Sized(10000000, 1000))
     ->Unit(benchmark::kMicrosecond)
     ->UseRealTime();
 BENCHMARK(ReadAndHash)
     ->RangeMultiplier(10)
-    ->Range(100, 10000000)
+    ->Range(100, Sized(10000000, 1000))
     ->Unit(benchmark::kMicrosecond)
     ->UseRealTime();
 BENCHMARK(Ffprobe)
     ->RangeMultiplier(10)
-    ->Range(100, 10000000)
+    ->Range(100, Sized(10000000, 1000))
     ->Unit(benchmark::kMicrosecond)
     ->UseRealTime();
 

@@ -12,6 +12,7 @@
 #include <cstdio>
 #include <filesystem>
 
+#include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/Describe.h"
@@ -25,7 +26,7 @@ extern "C" {
 
 namespace {
 
-constexpr int kMovies = 1000;
+const int kMovies = Sized(1000, 20);
 
 // Short movies with one picture and one sound track, deleted when the process ends.
 class MovieFolder {

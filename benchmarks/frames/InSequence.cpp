@@ -12,14 +12,15 @@
 #include <vector>
 
 #include "benchmarks/frames/SampleFilm.h"
+#include "benchmarks/support/Brief.h"
 #include "tests/support/Quoted.h"
 
 namespace {
 
 const SampleFilm& FilmOf(int depth) {
     static const SampleFilm eight("-c:v libx264 -preset fast -g 25 -bf 2 -pix_fmt yuv420p -b:v 20M",
-                                  250);
-    static const SampleFilm ten("-c:v prores_ks -profile:v 2", 100);
+                                  Sized(250, 10));
+    static const SampleFilm ten("-c:v prores_ks -profile:v 2", Sized(100, 10));
     return depth == 8 ? eight : ten;
 }
 

@@ -13,12 +13,13 @@
 #include <vector>
 
 #include "benchmarks/frames/SampleFilm.h"
+#include "benchmarks/support/Brief.h"
 #include "reference_host/quicktime/AvOwners.h"
 
 namespace {
 
-constexpr int kFrames = 500;
-constexpr int kAsked = 40;
+const int kFrames = Sized(500, 20);
+const int kAsked = Sized(40, 5);
 
 const SampleFilm& Film() {
     static const SampleFilm film("-c:v libx264 -preset fast -g 50 -bf 2 -pix_fmt yuv420p -b:v 20M",

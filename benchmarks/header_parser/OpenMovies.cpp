@@ -11,6 +11,7 @@
 #include <memory>
 
 #include "benchmarks/header_parser/LongMovie.h"
+#include "benchmarks/support/Brief.h"
 #include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
 
@@ -78,10 +79,13 @@ void ReadTheSameBytes(benchmark::State& state) {
     state.SetBytesProcessed(static_cast<std::int64_t>(state.iterations() * file.HeaderSize()));
 }
 
-BENCHMARK(ParseHeader)->RangeMultiplier(10)->Range(100, 10000000)->Unit(benchmark::kMicrosecond);
+BENCHMARK(ParseHeader)
+    ->RangeMultiplier(10)
+    ->Range(100, Sized(10000000, 1000))
+    ->Unit(benchmark::kMicrosecond);
 BENCHMARK(ReadTheSameBytes)
     ->RangeMultiplier(10)
-    ->Range(100, 10000000)
+    ->Range(100, Sized(10000000, 1000))
     ->Unit(benchmark::kMicrosecond);
 
 }  // namespace

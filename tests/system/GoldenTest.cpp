@@ -2,9 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The whole tree of one movie of each kind, kept as text in tests/golden. After a
-// change that is meant, write the files anew and judge the difference:
-//
-//     CLIPHOST_UPDATE_GOLDEN=1 build/asan/tests/test_system --gtest_filter='*Golden*'
+// change that is meant, `./dev golden` writes the files anew and shows the difference.
 
 #include <cstdlib>
 #include <fstream>

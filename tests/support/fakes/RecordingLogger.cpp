@@ -45,6 +45,18 @@ private:
 
 }  // namespace
 
+std::string ReturnRecord(const std::string& code, const std::string& expression,
+                         const std::string& function) {
+    return "NCF_RETURN(0x" + code + "): " + expression + " : " + function;
+}
+
+std::string ReturnRecord(NCFRESULT result, const std::string& expression,
+                         const std::string& function) {
+    std::ostringstream code;
+    code << std::hex << static_cast<ncfUInt32>(result);
+    return ReturnRecord(code.str(), expression, function);
+}
+
 RecordingLog::RecordingLog(FakeHost& host, Journal* journal) {
     ::records.clear();
     recordJournal = journal;
@@ -72,6 +84,19 @@ int RecordingLog::count(const std::string& text) const {
     return static_cast<int>(
         std::count_if(::records.begin(), ::records.end(),
                       [&](const LoggedRecord& record) { return record.text == text; }));
+}
+
+testing::AssertionResult RecordingLog::once(const std::string& text) const {
+    const int times = count(text);
+    if (times == 1) {
+        return testing::AssertionSuccess();
+    }
+    testing::AssertionResult failure = testing::AssertionFailure();
+    failure << "logged " << times << " times: " << text << "\nThe records are:";
+    for (const LoggedRecord& record : ::records) {
+        failure << "\n  " << record.text;
+    }
+    return failure;
 }
 
 bool RecordingLog::contains(const std::string& piece) const {

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <gtest/gtest.h>
+
 #include <string>
 #include <vector>
 
@@ -17,6 +19,12 @@ struct LoggedRecord {
     bool flagged;
 };
 
+// The record of a failed NCF_RETURN. The code is the result in hexadecimal.
+std::string ReturnRecord(const std::string& code, const std::string& expression,
+                         const std::string& function);
+std::string ReturnRecord(NCFRESULT result, const std::string& expression,
+                         const std::string& function);
+
 // While it lives, records of the module are kept instead of discarded: starts
 // the sink with a lock of the fake host. One at a time.
 class RecordingLog {
@@ -27,6 +35,13 @@ public:
     const std::vector<LoggedRecord>& records() const;
     // Number of records with exactly this text.
     int count(const std::string& text) const;
+    // Exactly one record has this text. Where not, the failure tells all records.
+    testing::AssertionResult once(const std::string& text) const;
+    template <class Result>
+    testing::AssertionResult returned(const Result& result, const std::string& expression,
+                                      const std::string& function) const {
+        return once(ReturnRecord(result, expression, function));
+    }
     bool contains(const std::string& piece) const;
     void clear();
 };

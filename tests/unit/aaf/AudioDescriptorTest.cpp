@@ -198,8 +198,8 @@ TEST_F(AudioDescriptorTest, OnlyTheFirstDescriptorSetsTheRateOfAll) {
 
 TEST_F(AudioDescriptorTest, TellsTrackChannelsAndBits) {
     ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_EQ(log.count(std::string(kFunction) + "qtTrack: 2; numAudioChannels: 2"), 1);
-    EXPECT_EQ(log.count(std::string(kFunction) + "qtTrack: 2; quantizationBits: 16"), 1);
+    EXPECT_TRUE(log.once(std::string(kFunction) + "qtTrack: 2; numAudioChannels: 2"));
+    EXPECT_TRUE(log.once(std::string(kFunction) + "qtTrack: 2; quantizationBits: 16"));
 }
 
 TEST_F(AudioDescriptorTest, ARefusedCellDoesNotEndTheClip) {
@@ -266,7 +266,7 @@ TEST_F(AudioDescriptorTest, FailuresOfTheClipAreLoggedAndReturned) {
         Track().native = native;
         clip->failures = {{operation, NCF_E_NOTFOUND}};
         EXPECT_EQ(Add(), NCF_E_NOTFOUND) << operation;
-        EXPECT_EQ(log.count(ReturnRecord(NCF_E_NOTFOUND, statement, kFunction)), 1) << operation;
+        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kFunction)) << operation;
     }
 }
 
@@ -274,21 +274,18 @@ TEST_F(AudioDescriptorTest, FailuresOfTheWrapperAreLoggedAndReturned) {
     Track().native = 0;
     wrapper.soundResult = NCF_E_NOTFOUND;
     EXPECT_EQ(Add(), NCF_E_NOTFOUND);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  NCF_E_NOTFOUND,
-                  "qtWrapper->GetAudioInfoForTrack(qtTrack, &numAudioChannels, &sampleRate, "
-                  "&formatID, NULL, &bytesPerPacket, NULL, NULL, NULL, NULL)",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(
+        log.returned(NCF_E_NOTFOUND,
+                     "qtWrapper->GetAudioInfoForTrack(qtTrack, &numAudioChannels, &sampleRate, "
+                     "&formatID, NULL, &bytesPerPacket, NULL, NULL, NULL, NULL)",
+                     kFunction));
 }
 
 TEST_F(AudioDescriptorTest, AWrapperThatCannotBeMadeIsLoggedAndReturned) {
     Track().native = 0;
     host.refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_NOTFOUND);
     EXPECT_EQ(Add(), NCF_E_NOTFOUND);
-    EXPECT_EQ(log.count(ReturnRecord(NCF_E_NOTFOUND, "media->GetQuickTimeInterface(qtWrapper)",
-                                     kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, "media->GetQuickTimeInterface(qtWrapper)", kFunction));
 }
 
 struct RefusedCall {
@@ -312,7 +309,7 @@ TEST_P(AudioRefusalTest, IsLoggedWithItsStatementAndReturned) {
     Track().metadata.isBigEndian = refused.bigEndian;
     aaf.refuse(refused.call, AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), AAFRESULT_NOMEMORY);
-    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, refused.statement, kFunction)), 1);
+    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, refused.statement, kFunction));
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -360,7 +357,7 @@ TEST_F(AudioDescriptorTest, ARefusedViewIsLoggedAndReturned) {
         aaf.clearRefusals();
         aaf.refuse("PCMDescriptor", AAFRESULT_NOMEMORY, ++nth);
         EXPECT_EQ(Add(), AAFRESULT_NOMEMORY) << name;
-        EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, statement, kFunction)), 1) << name;
+        EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, statement, kFunction)) << name;
     }
 }
 

@@ -37,9 +37,9 @@ TEST_F(BinColumnsTest, AnEntryChecksItsArguments) {
     EXPECT_EQ(AddBinColumnEntry(mob, Console(), nullptr, L"b"), NCF_E_INVALIDARG);
     EXPECT_EQ(AddBinColumnEntry(mob, Console(), L"a", nullptr), NCF_E_INVALIDARG);
     const std::string function = "NMA::Impl::AddBinColumnEntry";
-    EXPECT_EQ(log.count("CHK_INARG(pMobMasterMob)" + function), 1);
-    EXPECT_EQ(log.count("CHK_INARG(pBinColumnEntry)" + function), 1);
-    EXPECT_EQ(log.count("CHK_INARG(pBinColumnValue)" + function), 1);
+    EXPECT_TRUE(log.once("CHK_INARG(pMobMasterMob)" + function));
+    EXPECT_TRUE(log.once("CHK_INARG(pBinColumnEntry)" + function));
+    EXPECT_TRUE(log.once("CHK_INARG(pBinColumnValue)" + function));
 }
 
 TEST_F(BinColumnsTest, ARefusedEntryIsToldAndFails) {
@@ -80,10 +80,10 @@ TEST_F(BinColumnsTest, ARefusedAspectRatioIsLoggedAndPassedOver) {
     aaf.refuse("MasterMob1.AppendComment");
     AddAspectRatioBinColumnEntry(mob, Console(), info, 4, 3, ratio);
     EXPECT_EQ(ratio.numerator, 4);
-    EXPECT_EQ(log.count("NCF_SKIP(0x80000008): AddBinColumnEntry(pMobMasterMob, pConsole, &iar[0], "
-                        "(aafCharacter *) arStr.GetWCHARString()) : "
-                        "NMA::Impl::AddAspectRatioBinColumnEntry"),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_SKIP(0x80000008): AddBinColumnEntry(pMobMasterMob, pConsole, &iar[0], "
+                 "(aafCharacter *) arStr.GetWCHARString()) : "
+                 "NMA::Impl::AddAspectRatioBinColumnEntry"));
 }
 
 TEST_F(BinColumnsTest, TheMakersNameIsCutFromACodecsName) {
@@ -122,9 +122,7 @@ TEST_F(BinColumnsTest, ANameThatRefusesToBeReadStopsTheClip) {
         name.attach(new StubbornString("Apple ProRes", operation, NCF_E_NOTFOUND));
         clip->codecString = name.inArg();
         EXPECT_EQ(AddVideo(), NCF_E_NOTFOUND) << operation;
-        EXPECT_EQ(
-            log.count(ReturnRecord(NCF_E_NOTFOUND, statement, "NMA::Impl::AddVideoBinColumnEntry")),
-            1);
+        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, "NMA::Impl::AddVideoBinColumnEntry"));
         clip->codecString = nullptr;
     }
     EXPECT_EQ(aaf.callCount(), 0);
@@ -133,9 +131,8 @@ TEST_F(BinColumnsTest, ANameThatRefusesToBeReadStopsTheClip) {
 TEST_F(BinColumnsTest, ACodecsCodeIsNeeded) {
     clip->failures["GetDataFormat"] = NCF_E_NOTFOUND;
     EXPECT_EQ(AddVideo(), NCF_E_NOTFOUND);
-    EXPECT_EQ(log.count(ReturnRecord(NCF_E_NOTFOUND, "media->GetDataFormat(&codecType)",
-                                     "NMA::Impl::AddVideoBinColumnEntry")),
-              1);
+    EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, "media->GetDataFormat(&codecType)",
+                             "NMA::Impl::AddVideoBinColumnEntry"));
 }
 
 TEST_F(BinColumnsTest, ARefusedVideoCellIsLoggedByItsKindAndPassedOver) {
@@ -150,9 +147,8 @@ TEST_F(BinColumnsTest, ARefusedVideoCellIsLoggedByItsKindAndPassedOver) {
         aaf.refuse("MasterMob1.AppendComment");
         clip->codecName = name;
         EXPECT_EQ(AddVideo(), NCF_OK);
-        EXPECT_EQ(log.count(std::string("NCF_SKIP(0x80000008): ") + statement +
-                            " : NMA::Impl::AddVideoBinColumnEntry"),
-                  1)
+        EXPECT_TRUE(log.once(std::string("NCF_SKIP(0x80000008): ") + statement +
+                             " : NMA::Impl::AddVideoBinColumnEntry"))
             << name;
     }
 }
@@ -172,10 +168,10 @@ TEST_F(BinColumnsTest, SoundIsNamedByItsCode) {
 TEST_F(BinColumnsTest, ARefusedSoundCellIsLoggedAndPassedOver) {
     aaf.refuse("MasterMob1.AppendComment");
     AddAudioFormatBinColumnEntry(mob, Console(), 0);
-    EXPECT_EQ(log.count("NCF_SKIP(0x80000008): AddBinColumnEntry(pMobMasterMob, pConsole, &aff[0], "
-                        "(aafCharacter *) arStr.GetWCHARString()) : "
-                        "NMA::Impl::AddAudioFormatBinColumnEntry"),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_SKIP(0x80000008): AddBinColumnEntry(pMobMasterMob, pConsole, &aff[0], "
+                 "(aafCharacter *) arStr.GetWCHARString()) : "
+                 "NMA::Impl::AddAudioFormatBinColumnEntry"));
 }
 
 TEST_F(BinColumnsTest, TheMappingTiesParametersToColumns) {

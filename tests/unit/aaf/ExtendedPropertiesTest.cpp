@@ -119,19 +119,16 @@ TEST_F(ExtendedPropertiesTest, EveryRefusalComesBackUnchanged) {
 TEST_F(ExtendedPropertiesTest, TheRecordTypeLogsTheStatementThatFailed) {
     aaf.refuse("TypeDefRecord1.Initialize", AAFRESULT_BAD_TYPE);
     EXPECT_EQ(Put(), AAFRESULT_BAD_TYPE);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  AAFRESULT_BAD_TYPE,
-                  "pTDRec->Initialize(kAAFTypeID_NivoBoundsBox, memberTypes, memberNames, "
-                  "aafBoundsBoxNumMembers, L\"BoundsBox\")",
-                  "NMA::Impl::InitializeNivoBoundsBoxType")),
-              1);
+    EXPECT_TRUE(
+        log.returned(AAFRESULT_BAD_TYPE,
+                     "pTDRec->Initialize(kAAFTypeID_NivoBoundsBox, memberTypes, memberNames, "
+                     "aafBoundsBoxNumMembers, L\"BoundsBox\")",
+                     "NMA::Impl::InitializeNivoBoundsBoxType"));
     aaf.refuse("TypeDefRecord2.QueryInterface", AAFRESULT_BAD_TYPE);
     EXPECT_EQ(Put(), AAFRESULT_BAD_TYPE);
-    EXPECT_EQ(
-        log.count(ReturnRecord(AAFRESULT_BAD_TYPE,
-                               "pTypeDef->QueryInterface(IID_IAAFTypeDefRecord, (void**) &pTDRec)",
-                               "NMA::Impl::InitializeNivoBoundsBoxType")),
-        1);
+    EXPECT_TRUE(log.returned(AAFRESULT_BAD_TYPE,
+                             "pTypeDef->QueryInterface(IID_IAAFTypeDefRecord, (void**) &pTDRec)",
+                             "NMA::Impl::InitializeNivoBoundsBoxType"));
 }
 
 TEST_F(ExtendedPropertiesTest, AFailedLookUpOfTheRationalTypeIsUnexpected) {
@@ -189,9 +186,7 @@ TEST_F(ExtendedPropertiesTest, SliceCountLogsTheStatementThatFailed) {
         aaf.clearRefusals();
         aaf.refuse(call, AAFRESULT_NOMEMORY);
         EXPECT_EQ(SetCount(10), AAFRESULT_NOMEMORY) << call;
-        EXPECT_EQ(
-            log.count(ReturnRecord(AAFRESULT_NOMEMORY, statement, "NMA::Impl::SetAVCISliceCount")),
-            1)
+        EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, statement, "NMA::Impl::SetAVCISliceCount"))
             << call;
     }
 }

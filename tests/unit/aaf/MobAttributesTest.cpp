@@ -103,7 +103,7 @@ TEST_F(MobAttributesTest, AFailedLookUpOfADefinitionIsUnexpected) {
 
 TEST_F(MobAttributesTest, TheOptionNeedsAList) {
     EXPECT_EQ(AddReformattingOption(Dictionary(), nullptr, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log.count("CHK_INARG(pPVArray)NMA::Impl::AddReformattingOption"), 1);
+    EXPECT_TRUE(log.once("CHK_INARG(pPVArray)NMA::Impl::AddReformattingOption"));
 }
 
 TEST_F(MobAttributesTest, TheOptionLogsTheStatementThatFailed) {
@@ -126,9 +126,7 @@ TEST_F(MobAttributesTest, TheOptionLogsTheStatementThatFailed) {
         aaf.clearRefusals();
         aaf.refuse(call, AAFRESULT_NOMEMORY);
         EXPECT_EQ(AddReformattingOption(Dictionary(), array, value), AAFRESULT_NOMEMORY) << call;
-        EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, statement,
-                                         "NMA::Impl::AddReformattingOption")),
-                  1)
+        EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, statement, "NMA::Impl::AddReformattingOption"))
             << call;
     }
 }

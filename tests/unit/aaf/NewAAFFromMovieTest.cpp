@@ -210,8 +210,8 @@ TEST_F(NewAAFFromMovieTest, ChecksItsArguments) {
     IAAFFile* out = nullptr;
     EXPECT_EQ(NewAAFFromMovie(none, Console(), &out, host.factory()), NCF_E_INVALIDARG);
     EXPECT_EQ(NewAAFFromMovie(Media(), Console(), nullptr, host.factory()), NCF_E_INVALIDARG);
-    EXPECT_EQ(log.count(std::string("CHK_INARG(media.get())") + kFunction), 1);
-    EXPECT_EQ(log.count(std::string("CHK_INARG(pOutAAFFile)") + kFunction), 1);
+    EXPECT_TRUE(log.once(std::string("CHK_INARG(media.get())") + kFunction));
+    EXPECT_TRUE(log.once(std::string("CHK_INARG(pOutAAFFile)") + kFunction));
 }
 
 TEST_F(NewAAFFromMovieTest, AnEmptyPathFailsBeforeTheFileIsOpened) {
@@ -243,13 +243,11 @@ TEST_F(NewAAFFromMovieTest, AFailureInTheTracksLeavesNoMobInTheHeader) {
     clip->failures["GetAudioTrackCount"] = NCF_E_NOTFOUND;
     EXPECT_EQ(Describe(), NCF_E_NOTFOUND);
     EXPECT_EQ(aaf.place("Header1.AddMob"), -1);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  NCF_E_NOTFOUND,
-                  "AddTracksToAAF(media, pConsole, pHeader, pDictionary, pMobMasterMob, "
-                  "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, "
-                  "pMultiDescriptor, pComponentFactory, &absoluteStartTime)",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(NCF_E_NOTFOUND,
+                             "AddTracksToAAF(media, pConsole, pHeader, pDictionary, pMobMasterMob, "
+                             "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, "
+                             "pMultiDescriptor, pComponentFactory, &absoluteStartTime)",
+                             kFunction));
 }
 
 TEST_F(NewAAFFromMovieTest, FailuresOfTheClipAreLoggedAndReturned) {
@@ -261,7 +259,7 @@ TEST_F(NewAAFFromMovieTest, FailuresOfTheClipAreLoggedAndReturned) {
     for (const auto& [operation, statement] : statements) {
         clip->failures = {{operation, NMA_E_NOTINITIALIZED}};
         EXPECT_EQ(Describe(), NMA_E_NOTINITIALIZED) << operation;
-        EXPECT_EQ(log.count(ReturnRecord(NMA_E_NOTINITIALIZED, statement, kFunction)), 1);
+        EXPECT_TRUE(log.returned(NMA_E_NOTINITIALIZED, statement, kFunction));
     }
 }
 
@@ -288,7 +286,7 @@ TEST_P(DescriptionRefusalTest, IsLoggedWithItsStatementAndReturned) {
     clip->setAlpha(true, false);
     aaf.refuse(GetParam().call, AAFRESULT_NOMEMORY);
     EXPECT_EQ(Describe(), AAFRESULT_NOMEMORY);
-    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, GetParam().statement, kFunction)), 1);
+    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, GetParam().statement, kFunction));
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -351,27 +349,23 @@ INSTANTIATE_TEST_SUITE_P(
 TEST_F(NewAAFFromMovieTest, ARefusedSourceMobOrEssenceViewIsLogged) {
     aaf.refuse("ClassDefSourceMob1.CreateInstance", AAFRESULT_NOMEMORY, 2);
     EXPECT_EQ(Describe(), AAFRESULT_NOMEMORY);
-    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY,
-                                     "defs.cdSourceMob()->CreateInstance(IID_IAAFMob, (IUnknown "
-                                     "**)&pMobSourceMob)",
-                                     kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY,
+                             "defs.cdSourceMob()->CreateInstance(IID_IAAFMob, (IUnknown "
+                             "**)&pMobSourceMob)",
+                             kFunction));
     // The multiple descriptor's essence view is asked after all tracks.
     aaf.refuse("MultipleDescriptor1.QueryInterface", AAFRESULT_NOMEMORY, 3);
     EXPECT_EQ(Describe(), AAFRESULT_NOMEMORY);
-    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY,
-                                     "pMultiDescriptor->QueryInterface "
-                                     "(IID_IAAFEssenceDescriptor, (void **)&pEssenceDesc)",
-                                     kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY,
+                             "pMultiDescriptor->QueryInterface "
+                             "(IID_IAAFEssenceDescriptor, (void **)&pEssenceDesc)",
+                             kFunction));
 }
 
 TEST_F(NewAAFFromMovieTest, ARefusedColumnMappingIsLogged) {
     aaf.refuse("MasterMob1.AppendComment 'Field Ordering'");
     EXPECT_EQ(Describe(), NMA_E_AAF_ADD);
-    EXPECT_EQ(
-        log.count(ReturnRecord(NMA_E_AAF_ADD, "AddBinColMappingToMob( pMobMasterMob )", kFunction)),
-        1);
+    EXPECT_TRUE(log.returned(NMA_E_AAF_ADD, "AddBinColMappingToMob( pMobMasterMob )", kFunction));
 }
 
 TEST_F(NewAAFFromMovieTest, AFailedLookUpIsUnexpected) {
@@ -385,9 +379,8 @@ TEST_F(NewAAFFromMovieTest, WithoutALibraryTheLoadersCodeComesBack) {
          [](void*, const char*) -> void* { return nullptr; }});
     EXPECT_EQ(Describe(), AAFRESULT_DLL_LOAD_FAILED);
     AAFRunTimeLibrary::Instance().SetAccess(before);
-    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_DLL_LOAD_FAILED,
-                                     "AAFFileOpenTransient(&productID, &pTheAAFFile)", kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(AAFRESULT_DLL_LOAD_FAILED,
+                             "AAFFileOpenTransient(&productID, &pTheAAFFile)", kFunction));
 }
 
 }  // namespace

@@ -82,7 +82,7 @@ TEST_F(SyntheticTimecodeTest, ADateThatCannotBeReadIsMidnight) {
     EXPECT_EQ(host.console().count(4, "Modification Date is day 0, hour 0, minute 0, second 0\n\n"),
               1);
     // The system's number for a file that is not there is 2 everywhere.
-    EXPECT_EQ(log.count(std::string(kFunction) + " - FileTimeToSystemTime, hresult: 2"), 1);
+    EXPECT_TRUE(log.once(std::string(kFunction) + " - FileTimeToSystemTime, hresult: 2"));
 }
 
 TEST_F(SyntheticTimecodeTest, TellsTheErrorOfTheFailedQueryNotOfTheLogsOwnWork) {
@@ -100,7 +100,7 @@ TEST_F(SyntheticTimecodeTest, TellsTheErrorOfTheFailedQueryNotOfTheLogsOwnWork) 
     });
     PluginLogSink::Instance().Start(host.factory());
     ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_EQ(log.count(std::string(kFunction) + " - FileTimeToSystemTime, hresult: 2"), 1);
+    EXPECT_TRUE(log.once(std::string(kFunction) + " - FileTimeToSystemTime, hresult: 2"));
 }
 
 TEST_F(SyntheticTimecodeTest, AfterOtherSlotsTheMainSlotsFillerEndsTheClip) {
@@ -143,40 +143,36 @@ TEST_F(SyntheticTimecodeTest, NeedsRateAndLength) {
     EXPECT_EQ(Add(), NMA_E_NOTINITIALIZED);
     clip->failures = {{"GetMovieLength", NMA_E_NOTINITIALIZED}};
     EXPECT_EQ(Add(), NMA_E_NOTINITIALIZED);
-    EXPECT_EQ(log.count(ReturnRecord(NMA_E_NOTINITIALIZED, "media->GetMovieLength(&movieLength)",
-                                     kFunction)),
-              1);
+    EXPECT_TRUE(
+        log.returned(NMA_E_NOTINITIALIZED, "media->GetMovieLength(&movieLength)", kFunction));
 }
 
 TEST_F(SyntheticTimecodeTest, ARateThatRoundsToNothingIsRefused) {
     clip->rate = {1, 3};
     clip->setTiming();
     EXPECT_EQ(Add(), NCF_E_INVALIDARG);
-    EXPECT_EQ(log.count(ReturnRecord(NCF_E_INVALIDARG,
-                                     "ConvertTCToFrames( pUTCTime->tm_hour, pUTCTime->tm_min, "
-                                     "pUTCTime->tm_sec, 0, numFPS, TRUE, &tcInFrames)",
-                                     kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(NCF_E_INVALIDARG,
+                             "ConvertTCToFrames( pUTCTime->tm_hour, pUTCTime->tm_min, "
+                             "pUTCTime->tm_sec, 0, numFPS, TRUE, &tcInFrames)",
+                             kFunction));
 }
 
 TEST_F(SyntheticTimecodeTest, LogsTheSlotThatFailed) {
     aaf.refuse("SourceMob1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY, 1);
     EXPECT_EQ(Add(), NMA_E_AAF_ADD);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  NMA_E_AAF_ADD,
-                  "AddTimecodeAAFTrack( timecode, tcTrackNum++, (*totalExistingSlots)++, "
-                  "aafEditRate, maxDuration, 0, 0, pDictionary, pMobSourceMob)",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(
+        log.returned(NMA_E_AAF_ADD,
+                     "AddTimecodeAAFTrack( timecode, tcTrackNum++, (*totalExistingSlots)++, "
+                     "aafEditRate, maxDuration, 0, 0, pDictionary, pMobSourceMob)",
+                     kFunction));
     slots = 0;
     aaf.refuse("SourceMob1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY, 2);
     EXPECT_EQ(Add(), NMA_E_AAF_ADD);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  NMA_E_AAF_ADD,
-                  "AddTimecodeAAFTrack( auxTimecode, tcTrackNum, (*totalExistingSlots)++, "
-                  "aafEditRate, movieLength, maxDuration, 0, pDictionary, pMobSourceMob)",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(
+        log.returned(NMA_E_AAF_ADD,
+                     "AddTimecodeAAFTrack( auxTimecode, tcTrackNum, (*totalExistingSlots)++, "
+                     "aafEditRate, movieLength, maxDuration, 0, pDictionary, pMobSourceMob)",
+                     kFunction));
 }
 
 }  // namespace

@@ -120,12 +120,11 @@ TEST_P(TimecodeFailureTest, IsToldWithTheLibrarysResultAndHasACodeOfItsOwn) {
     const std::string start =
         std::string(step.message) + ", AAFResult = 0x8012015e, QuickTimeToAAF(";
     EXPECT_EQ(lines.lines()[0].text.substr(0, start.size()), start);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  step.result,
-                  "AddTimecode( pDictionary, movieEditRate, trackLabel, pMobSourceMob, nSlotID, "
-                  "movieLength, maxLength, startTime, timecode, timecodeTrackNum)",
-                  "NMA::Impl::AddTimecodeAAFTrack")),
-              1);
+    EXPECT_TRUE(
+        log.returned(step.result,
+                     "AddTimecode( pDictionary, movieEditRate, trackLabel, pMobSourceMob, nSlotID, "
+                     "movieLength, maxLength, startTime, timecode, timecodeTrackNum)",
+                     "NMA::Impl::AddTimecodeAAFTrack"));
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -172,7 +171,7 @@ TEST_F(TimecodeTest, AFailedLookUpIsAnUnknownException) {
     aaf.refuse("Dictionary.LookupDataDef");
     EXPECT_EQ(Add(0), NCF_E_UNEXPECTED);
     EXPECT_TRUE(lines.contains("Received an unknown exception, QuickTimeToAAF("));
-    EXPECT_EQ(log.count("NMA::Impl::AddTimecodeReceived an unknown exception"), 1);
+    EXPECT_TRUE(log.once("NMA::Impl::AddTimecodeReceived an unknown exception"));
 }
 
 TEST_F(TimecodeTest, TheMobsIdIsAskedAndItsFailureCounts) {

@@ -234,14 +234,14 @@ TEST_F(TracksTest, AlphaWithoutAVideoTrackNeedsARetrieverBeforeAnyDescriptor) {
     const std::string missing =
         std::string("NCFASSERT( QuickTimeToAAFInfoRetriever::GetInstance() )") + kFunction;
     EXPECT_EQ(Add(), NCF_E_FAIL);
-    EXPECT_EQ(log.count(missing), 1);
+    EXPECT_TRUE(log.once(missing));
     EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance(), nullptr) << "no track: no data files";
     EXPECT_TRUE(aaf.linesOf("Dictionary.CreateInstance AUID_AAFCDCIDescriptor").empty());
     EXPECT_EQ(aaf.place("CDCIDescriptor1"), -1);
 
     StartRetriever();  // as a clip described before has done
     EXPECT_EQ(Add(), NCF_OK);
-    EXPECT_EQ(log.count(missing), 1);
+    EXPECT_TRUE(log.once(missing));
     EXPECT_EQ(aaf.linesOf("MultipleDescriptor1.AppendFileDescriptor").size(), 1u);
 }
 
@@ -303,12 +303,11 @@ TEST_F(TracksTest, TimecodeWithoutARateIsRefused) {
     clip->timecode.resize(1);
     clip->timecode[0].metadata.numFrames = 0x100;
     EXPECT_EQ(Add(), NCF_E_INVALIDARG);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  NCF_E_INVALIDARG,
-                  "ConvertTCToFrames(tcInfo.hours, tcInfo.minutes, tcInfo.seconds, tcInfo.frames, "
-                  "tcFPS, *((bool*)&tcInfo.drop), &tcInFrames)",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(
+        NCF_E_INVALIDARG,
+        "ConvertTCToFrames(tcInfo.hours, tcInfo.minutes, tcInfo.seconds, tcInfo.frames, "
+        "tcFPS, *((bool*)&tcInfo.drop), &tcInFrames)",
+        kFunction));
 }
 
 TEST_F(TracksTest, AScaledStartGoesBeyond32Bits) {
@@ -386,7 +385,7 @@ TEST_F(TracksTest, FailuresOfTheClipAreLoggedAndReturned) {
         log.clear();
         clip->failures = {{operation, NCF_E_NOTFOUND}};
         EXPECT_EQ(Add(), NCF_E_NOTFOUND) << operation;
-        EXPECT_EQ(log.count(ReturnRecord(NCF_E_NOTFOUND, statement, kFunction)), 1) << operation;
+        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kFunction)) << operation;
     }
 }
 
@@ -394,43 +393,39 @@ TEST_F(TracksTest, SlotsThatAreRefusedAreLoggedAndReturned) {
     clip->timecode.resize(1);
     aaf.refuse("Master1.NewPhysSourceRef", AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), AAFRESULT_NOMEMORY);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  AAFRESULT_NOMEMORY,
-                  "AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, "
-                  "totalExistingSlots++, aaf_rate, movieLength, pDictionary, pMobMasterMob, "
-                  "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 )",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(
+        log.returned(AAFRESULT_NOMEMORY,
+                     "AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, "
+                     "totalExistingSlots++, aaf_rate, movieLength, pDictionary, pMobMasterMob, "
+                     "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 )",
+                     kFunction));
     clip->videoTracks = 0;
     clip->sound.resize(1);
     aaf.clearRefusals();
     aaf.refuse("Master1.NewPhysSourceRef", AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), AAFRESULT_NOMEMORY);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  AAFRESULT_NOMEMORY,
-                  "AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, "
-                  "totalExistingSlots, aaf_rate, movieLength, pDictionary, pMobMasterMob, "
-                  "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 )",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(
+        log.returned(AAFRESULT_NOMEMORY,
+                     "AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, "
+                     "totalExistingSlots, aaf_rate, movieLength, pDictionary, pMobMasterMob, "
+                     "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 )",
+                     kFunction));
     aaf.clearRefusals();
     aaf.refuse("Source1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), NMA_E_AAF_ADD);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  NMA_E_AAF_ADD,
-                  "AddTimecodeAAFTrack(timecode, startingSlot, totalExistingSlots++, aaf_rate, "
-                  "maxDuration, maxDuration, 0, pDictionary, pMobSourceMob)",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(
+        log.returned(NMA_E_AAF_ADD,
+                     "AddTimecodeAAFTrack(timecode, startingSlot, totalExistingSlots++, aaf_rate, "
+                     "maxDuration, maxDuration, 0, pDictionary, pMobSourceMob)",
+                     kFunction));
     clip->timecode.clear();
     aaf.clearRefusals();
     aaf.refuse("Source1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), NMA_E_AAF_ADD);
-    EXPECT_EQ(log.count(ReturnRecord(NMA_E_AAF_ADD,
-                                     "AddSyntheticTimeCode(media, &totalExistingSlots, pConsole, "
-                                     "pDictionary, pMobSourceMob)",
-                                     kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(NMA_E_AAF_ADD,
+                             "AddSyntheticTimeCode(media, &totalExistingSlots, pConsole, "
+                             "pDictionary, pMobSourceMob)",
+                             kFunction));
 }
 
 TEST_F(TracksTest, MissingDataFilesEndEveryClipWithVideo) {

@@ -41,7 +41,7 @@ TEST_P(VideoRefusalTest, IsLoggedWithItsStatementAndReturned) {
     }
     aaf.refuse(refused.call, AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), AAFRESULT_NOMEMORY);
-    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, refused.statement, kFunction)), 1);
+    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, refused.statement, kFunction));
 }
 
 INSTANTIATE_TEST_SUITE_P(

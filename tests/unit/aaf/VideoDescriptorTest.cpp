@@ -152,9 +152,8 @@ TEST_F(VideoDescriptorTest, APictureOfNoSizeIsRefused) {
     clip->pictureHeight = 1;
     clip->layout = 1;
     EXPECT_EQ(Add(), NCF_E_FAIL);
-    EXPECT_EQ(log.count(std::string("NCFASSERT( aafInfo.displayHeight && aafInfo.displayWidth )") +
-                        kFunction),
-              1);
+    EXPECT_TRUE(log.once(std::string("NCFASSERT( aafInfo.displayHeight && aafInfo.displayWidth )") +
+                         kFunction));
     // What comes before the display is set, nothing behind it.
     EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetSampledView 0 0 0 0"));
     EXPECT_FALSE(Called("SetDisplayView"));
@@ -377,12 +376,11 @@ TEST_F(VideoDescriptorTest, AnEmptyLineMapIsTheLibrarysToRefuse) {
     clip->nativePicture = 1;
     clip->record.displayHeight = clip->record.displayWidth = 10;
     EXPECT_EQ(Add(), AAFRESULT_NULL_PARAM);
-    EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NULL_PARAM,
-                                     "pDigitalImageDescriptor->SetVideoLineMap( "
-                                     "(aafUInt32)aafInfo.videoLineMapVect.size(), "
-                                     "(aafInt32*)&aafInfo.videoLineMapVect[0] )",
-                                     kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(AAFRESULT_NULL_PARAM,
+                             "pDigitalImageDescriptor->SetVideoLineMap( "
+                             "(aafUInt32)aafInfo.videoLineMapVect.size(), "
+                             "(aafInt32*)&aafInfo.videoLineMapVect[0] )",
+                             kFunction));
 }
 
 TEST_F(VideoDescriptorTest, AFailedPolicyIsReturnedAsItStands) {
@@ -407,22 +405,20 @@ TEST_F(VideoDescriptorTest, FailuresOfTheClipAreLoggedAndReturned) {
     for (const auto& [operation, statement] : statements) {
         clip->failures = {{operation, NCF_E_NOTFOUND}};
         EXPECT_EQ(Add(), NCF_E_NOTFOUND) << operation;
-        EXPECT_EQ(log.count(ReturnRecord(NCF_E_NOTFOUND, statement, kFunction)), 1) << operation;
+        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kFunction)) << operation;
     }
 }
 
 TEST_F(VideoDescriptorTest, ARefusedFileFormatCellEndsTheClip) {
     aaf.refuse("MasterMob1.AppendComment 'Video File Format'");
     EXPECT_EQ(Add(), NCF_E_FAIL);
-    EXPECT_EQ(log.count(ReturnRecord(
-                  NCF_E_FAIL, "AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0], &QTVff[0])",
-                  kFunction)),
-              1);
+    EXPECT_TRUE(log.returned(
+        NCF_E_FAIL, "AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0], &QTVff[0])", kFunction));
 }
 
 TEST_F(VideoDescriptorTest, TheMultipleDescriptorsRateIsSetOnceOnly) {
     EXPECT_EQ(FixMultiDescSampleRate(nullptr, {25, 1}), NCF_E_INVALIDARG);
-    EXPECT_EQ(log.count("CHK_INARG(pMultiDesc)NMA::Impl::FixMultiDescSampleRate"), 1);
+    EXPECT_TRUE(log.once("CHK_INARG(pMultiDesc)NMA::Impl::FixMultiDescSampleRate"));
     EXPECT_EQ(FixMultiDescSampleRate(multi, {48000, 1}), NCF_OK);
     EXPECT_EQ(FixMultiDescSampleRate(multi, {25, 1}), NCF_OK);
     EXPECT_EQ(aaf.linesOf("MultipleDescriptor1.SetSampleRate"),
@@ -450,9 +446,8 @@ TEST_F(VideoDescriptorTest, TheMultipleDescriptorsRateLogsTheStatementThatFailed
         aaf.clearRefusals();
         aaf.refuse(call, AAFRESULT_NOMEMORY);
         EXPECT_EQ(FixMultiDescSampleRate(multi, {25, 1}), AAFRESULT_NOMEMORY);
-        EXPECT_EQ(log.count(ReturnRecord(AAFRESULT_NOMEMORY, statement,
-                                         "NMA::Impl::FixMultiDescSampleRate")),
-                  1);
+        EXPECT_TRUE(
+            log.returned(AAFRESULT_NOMEMORY, statement, "NMA::Impl::FixMultiDescSampleRate"));
     }
 }
 

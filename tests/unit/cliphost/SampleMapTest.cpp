@@ -4,7 +4,7 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/unit/cliphost/StubSampleMap.h"
+#include "tests/support/fakes/StubSampleMapping.h"
 
 using cliphost::MappedSample;
 using cliphost::ReadMappedSample;
@@ -20,7 +20,7 @@ struct Stored {
 
 // A map over a list of samples, which answers as a module does: the size in 32
 // bits, runs as far as bytes follow each other.
-class FakeMap final : public cliphost_tests::StubSampleMap {
+class FakeMap final : public StubSampleMapping {
 public:
     explicit FakeMap(std::vector<Stored> samples) : samples_(std::move(samples)) {}
 

@@ -1,7 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/TemporalOffsets.h"
-#include "tests/unit/cliphost/StubSampleMap.h"
+#include "tests/support/fakes/StubSampleMapping.h"
 
 #include <gtest/gtest.h>
 
@@ -79,7 +79,7 @@ Times FarAway(std::size_t count) {
     return Times(count, {100, static_cast<std::int64_t>(count) * 50});
 }
 
-class FakeMap final : public cliphost_tests::StubSampleMap {
+class FakeMap final : public StubSampleMapping {
 public:
     explicit FakeMap(Times times) : times_(std::move(times)) {}
 

@@ -5,6 +5,7 @@
 // services made on first use, sound beside picture, names.
 
 #include "source/clips/NativeCodecs.h"
+#include "tests/support/fakes/StubClip.h"
 #include "tests/unit/clips/ClipFixture.h"
 #include "tests/unit/clips/FakeWrapper.h"
 
@@ -64,9 +65,8 @@ TEST_F(BaseClipServices, KeepsAWrapperWhoseMovieFailedToOpen) {
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> out;
     EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_E_FAIL);
     EXPECT_TRUE(out.isNull());
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "qtWrapper_->NewMovieFromFilePath(fileName_)",
-                                      "BaseClip::GetQuickTimeInterface")),
-              1);
+    EXPECT_TRUE(log->returned("80000008", "qtWrapper_->NewMovieFromFilePath(fileName_)",
+                              "BaseClip::GetQuickTimeInterface"));
     EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_OK);
     EXPECT_FALSE(out.isNull());
     EXPECT_EQ(journal.count("wrapper.NewMovieFromFilePath"), 1);
@@ -76,12 +76,11 @@ TEST_F(BaseClipServices, HandsARefusedWrapperOn) {
     host->refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_OUTOFMEMORY, 1);
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> out;
     EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(log->count(ReturnRecord("80000002",
-                                      "componentFactory_->CreateComponent("
-                                      "QTWrapper::CompID_QuickTimeWrapper, NULL, "
-                                      "QTWrapper::IID_IQuickTimeWrapper, (void **)&qtWrapper_)",
-                                      "BaseClip::GetQuickTimeInterface")),
-              1);
+    EXPECT_TRUE(log->returned("80000002",
+                              "componentFactory_->CreateComponent("
+                              "QTWrapper::CompID_QuickTimeWrapper, NULL, "
+                              "QTWrapper::IID_IQuickTimeWrapper, (void **)&qtWrapper_)",
+                              "BaseClip::GetQuickTimeInterface"));
     EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_OK) << "asked again";
 }
 
@@ -108,12 +107,10 @@ TEST_F(BaseClipServices, HandsRefusedReadersOn) {
     NCFSmartPtr<QTWrapper::IQTAudioReader> audio;
     EXPECT_EQ(clip->GetQuickTimeVideoReader(video), NCF_E_ABORT);
     EXPECT_EQ(clip->GetQuickTimeAudioReader(audio), NCF_E_FAIL);
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "qtWrapper->GetQTVideoReader(qtAPIVideoReader_)",
-                                      "BaseClip::GetQuickTimeVideoReader")),
-              1);
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "qtWrapper->GetQTAudioReader(qtAPIAudioReader_)",
-                                      "BaseClip::GetQuickTimeAudioReader")),
-              1);
+    EXPECT_TRUE(log->returned("80000007", "qtWrapper->GetQTVideoReader(qtAPIVideoReader_)",
+                              "BaseClip::GetQuickTimeVideoReader"));
+    EXPECT_TRUE(log->returned("80000008", "qtWrapper->GetQTAudioReader(qtAPIAudioReader_)",
+                              "BaseClip::GetQuickTimeAudioReader"));
     host->refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_OUTOFMEMORY);
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> out;
     EXPECT_EQ(clip->GetQuickTimeInterface(out), NCF_OK) << "made already";
@@ -144,9 +141,9 @@ TEST_F(BaseClipSound, GivesThePicturesFigureWhenBothAreEquallyLong) {
     EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
     EXPECT_EQ(samples, 480000u);
     EXPECT_TRUE(enough);
-    EXPECT_EQ(log->count("BaseClip::ObtainAudioTrackLengthaudioSamplesInVideoTS: 480000; "
-                         "audioSamplesInAudioTrackTS: 480000"),
-              1);
+    EXPECT_TRUE(
+        log->once("BaseClip::ObtainAudioTrackLengthaudioSamplesInVideoTS: 480000; "
+                  "audioSamplesInAudioTrackTS: 480000"));
 }
 
 TEST_F(BaseClipSound, CutsSoundToThePicture) {
@@ -197,9 +194,9 @@ TEST_F(BaseClipSound, KeepsShortSoundAsItIs) {
     EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
     EXPECT_EQ(samples, 432000u);
     EXPECT_FALSE(enough);
-    EXPECT_EQ(log->count("BaseClip::ObtainAudioTrackLengthNot enough audio, "
-                         "audioSamplesInVideoTS(480000) > audioSamplesInAudioTrackTS(432000)"),
-              1);
+    EXPECT_TRUE(
+        log->once("BaseClip::ObtainAudioTrackLengthNot enough audio, "
+                  "audioSamplesInVideoTS(480000) > audioSamplesInAudioTrackTS(432000)"));
     EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_OK) << "without the flag";
 }
 
@@ -208,25 +205,49 @@ TEST_F(BaseClipSound, HandsItsFailuresOn) {
     EXPECT_EQ(clip->ObtainAudioTrackLength(2, nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(clip->ObtainAudioTrackLength(9, &samples), NCF_E_NOTFOUND);
     EXPECT_EQ(samples, 0u);
-    EXPECT_EQ(log->count(ReturnRecord("8000000c", "GetAudioTrackMetadata(qtTrack, &audioInfo)",
-                                      "BaseClip::ObtainAudioTrackLength")),
-              1);
+    EXPECT_TRUE(log->returned("8000000c", "GetAudioTrackMetadata(qtTrack, &audioInfo)",
+                              "BaseClip::ObtainAudioTrackLength"));
     Sound().results["GetTrackDuration"] = NCF_E_ABORT;
     EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_E_ABORT);
-    EXPECT_EQ(log->count(ReturnRecord("80000007",
-                                      "CalculateAudioTrackLengthInSamples(qtTrack, "
-                                      "&audioSamplesInAudioTrackTS)",
-                                      "BaseClip::ObtainAudioTrackLength")),
-              1);
+    EXPECT_TRUE(log->returned("80000007",
+                              "CalculateAudioTrackLengthInSamples(qtTrack, "
+                              "&audioSamplesInAudioTrackTS)",
+                              "BaseClip::ObtainAudioTrackLength"));
     Sound().results.clear();
     Load();  // a clip that was not asked for rate and length
     EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NMA_E_NOTINITIALIZED);
-    EXPECT_EQ(log->count(ReturnRecord("a0000068", "GetEditRate(&avgMovieEditRate)",
-                                      "BaseClip::ObtainAudioTrackLength")),
-              1);
+    EXPECT_TRUE(log->returned("a0000068", "GetEditRate(&avgMovieEditRate)",
+                              "BaseClip::ObtainAudioTrackLength"));
     clip->SetEditRate(EditorSettings());
     EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NMA_E_NOTINITIALIZED);
-    EXPECT_EQ(log->count(ReturnRecord("a0000068", "GetMovieLength(&numVideoSamples)",
-                                      "BaseClip::ObtainAudioTrackLength")),
-              1);
+    EXPECT_TRUE(log->returned("a0000068", "GetMovieLength(&numVideoSamples)",
+                              "BaseClip::ObtainAudioTrackLength"));
+}
+
+// --- size and ratio ---------------------------------------------------------------------
+
+namespace {
+
+// Finds neither size nor ratio and doesn't say so.
+class SizelessClip : public StubClip {
+    NCFRESULT GetEncodedWidthAndHeightImpl(ncfUInt32*, ncfUInt32*) override { return NCF_OK; }
+    NCFRESULT GetImageAspectRatioImpl(ncfUInt32*, ncfUInt32*) override { return NCF_OK; }
+};
+
+}  // namespace
+
+TEST(BaseClip, TellsAMissingSizeFromAMissingRatio) {
+    FakeHost host;
+    const RecordingLog log(host);
+    SizelessClip clip;
+    ncfUInt32 a = 7;
+    ncfUInt32 b = 7;
+    EXPECT_EQ(clip.GetEncodedWidthAndHeight(&a, &b), NCF_E_FAIL);
+    EXPECT_TRUE(log.once("NCFASSERT( width_ && height_ )BaseClip::GetEncodedWidthAndHeight"));
+    const std::size_t before = log.records().size();
+    EXPECT_EQ(clip.GetImageAspectRatio(&a, &b), NMA_E_NOTINITIALIZED);
+    EXPECT_EQ(log.records().size(), before + 1) << "no more than the ratio that was found";
+    EXPECT_EQ(log.records().back().text, "BaseClip::GetImageAspectRatioimage_aspect_ratio: 0/0");
+    EXPECT_EQ(a, 7u);
+    EXPECT_EQ(b, 7u);
 }

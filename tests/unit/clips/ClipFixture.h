@@ -141,9 +141,3 @@ protected:
     FakeParser* parser = nullptr;
     std::tr1::shared_ptr<QuickTimeClip> clip;
 };
-
-// The record of a failed NCF_RETURN.
-inline std::string ReturnRecord(const std::string& code, const std::string& expression,
-                                const std::string& function) {
-    return "NCF_RETURN(0x" + code + "): " + expression + " : " + function;
-}

@@ -111,7 +111,7 @@ TEST_F(LoadMediaTest, RefusesANullPathAndLeavesTheClip) {
                         NCFSmartPtr<INCFComponentFactory>(host->factory()), media),
               NCF_E_INVALIDARG);
     EXPECT_EQ(media.get(), former);
-    EXPECT_EQ(log->count("CHK_INARG(filePath.inArg())LoadMedia"), 1);
+    EXPECT_TRUE(log->once("CHK_INARG(filePath.inArg())LoadMedia"));
 }
 
 TEST_F(LoadMediaTest, TriesTheWrapperWhenTheHeadersAreRefused) {
@@ -244,7 +244,7 @@ TEST_F(LoadMediaTest, FailsOnAnEmptyFile) {
 TEST_F(LoadMediaTest, RefusesAnEmptyPath) {
     EXPECT_EQ(IsContainer(""), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(flag, 0);
-    EXPECT_EQ(log->count("IsQuickTimeContainerfilePath->IsEmpty() !"), 1);
+    EXPECT_TRUE(log->once("IsQuickTimeContainerfilePath->IsEmpty() !"));
     EXPECT_EQ(log->records().back().kind, slog::kError);
 }
 
@@ -308,18 +308,16 @@ TEST_F(SlashesOfAStubbornString, StaysWhenTheStringCannotBeConverted) {
     string->toUtf32 = NCF_E_FAIL;
     EXPECT_EQ(Convert(), NCF_E_FAIL);
     EXPECT_EQ(string->Text(), "/a/b.mov");
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "filePath->ConvertTo(kNCFUTF32)",
-                                      "ConvertSlashesInPlace")),
-              1);
+    EXPECT_TRUE(
+        log->returned("80000008", "filePath->ConvertTo(kNCFUTF32)", "ConvertSlashesInPlace"));
 }
 
 TEST_F(SlashesOfAStubbornString, StaysWhenTheBufferIsRefused) {
     string->raw = NCF_E_ABORT;
     EXPECT_EQ(Convert(), NCF_E_ABORT);
     EXPECT_EQ(string->Text(), "/a/b.mov");
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "filePath->GetRawUTF32(&rawUTF32Path)",
-                                      "ConvertSlashesInPlace")),
-              1);
+    EXPECT_TRUE(
+        log->returned("80000007", "filePath->GetRawUTF32(&rawUTF32Path)", "ConvertSlashesInPlace"));
 }
 
 TEST_F(SlashesOfAStubbornString, EndsTheSearchQuietlyWhenItFails) {
@@ -335,8 +333,8 @@ TEST_F(SlashesOfAStubbornString, TouchesNothingButSlashes) {
     string->wrongPlace = 1;
     EXPECT_EQ(Convert(), NCF_E_FAIL);
     EXPECT_EQ(string->Text(), "/a/b.mov");
-    EXPECT_EQ(log->count("NCFASSERT( rawUTF32Path[slashPos] == rightSlash )ConvertSlashesInPlace"),
-              1);
+    EXPECT_TRUE(
+        log->once("NCFASSERT( rawUTF32Path[slashPos] == rightSlash )ConvertSlashesInPlace"));
     // A search that never gets on ends too.
     string->wrongPlace = 0;
     EXPECT_EQ(Convert(), NCF_E_FAIL);
@@ -346,7 +344,5 @@ TEST_F(SlashesOfAStubbornString, TouchesNothingButSlashes) {
 TEST_F(SlashesOfAStubbornString, FailsWhenTheEncodingCannotBeRestored) {
     string->back = NCF_E_OUTOFMEMORY;
     EXPECT_EQ(Convert(), NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(log->count(ReturnRecord("80000002", "filePath->ConvertTo(srcType)",
-                                      "ConvertSlashesInPlace")),
-              1);
+    EXPECT_TRUE(log->returned("80000002", "filePath->ConvertTo(srcType)", "ConvertSlashesInPlace"));
 }

@@ -158,21 +158,20 @@ TEST_F(QuickTimeClipAttributeTexts, LogsATextThatIsNotWellFormed) {
 TEST_F(QuickTimeClipAttributeTexts, FallsBackWithoutXmlComponent) {
     host->refuseCreation(kCLSID_XmlDocument, NCF_E_OUTOFMEMORY);
     EXPECT_FALSE(Color(Descriptor(kLabel)).hasVendorMetadata);
-    EXPECT_EQ(log->count(ReturnRecord("80000002", "op_res",
-                                      "QuickTimeClip::SetColorSpaceImplFromSpecificMedia")),
-              1);
+    EXPECT_TRUE(
+        log->returned("80000002", "op_res", "QuickTimeClip::SetColorSpaceImplFromSpecificMedia"));
 }
 
 TEST_F(QuickTimeClipAttributeTexts, FallsBackOnATextThatIsNotThere) {
     Picture().nullTexts = true;
     Picture().SetRasterText("");
     EXPECT_FALSE(Color("").hasVendorMetadata);
-    EXPECT_EQ(log->count("CHK_PTR(pCMString.inArg())"
-                         "QuickTimeClip::SetColorSpaceImplFromSpecificMedia"),
-              1);
-    EXPECT_EQ(log->count("CHK_PTR(pRIString.inArg())"
-                         "QuickTimeClip::SetGeometryImplFromSpecificMedia"),
-              1);
+    EXPECT_TRUE(
+        log->once("CHK_PTR(pCMString.inArg())"
+                  "QuickTimeClip::SetColorSpaceImplFromSpecificMedia"));
+    EXPECT_TRUE(
+        log->once("CHK_PTR(pRIString.inArg())"
+                  "QuickTimeClip::SetGeometryImplFromSpecificMedia"));
 }
 
 TEST_F(QuickTimeClipAttributeTexts, FallsBackWhenTheTextsThrow) {
@@ -233,10 +232,8 @@ TEST_F(QuickTimeClipAttributeTexts, HandsFailuresToReachTheTextOver) {
     Picture().results["GetCMAttributes"] = NCF_E_FAIL;
     Load();
     EXPECT_TRUE(clip->IsLoaded());
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "pSD->GetRIAttributes(pRIString.outArg())",
-                                      "QuickTimeClip::SetGeometryImplFromSpecificMedia")),
-              1);
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "vdscr->GetCMAttributes(pCMString.outArg())",
-                                      "QuickTimeClip::SetColorSpaceImplFromSpecificMedia")),
-              1);
+    EXPECT_TRUE(log->returned("80000008", "pSD->GetRIAttributes(pRIString.outArg())",
+                              "QuickTimeClip::SetGeometryImplFromSpecificMedia"));
+    EXPECT_TRUE(log->returned("80000008", "vdscr->GetCMAttributes(pCMString.outArg())",
+                              "QuickTimeClip::SetColorSpaceImplFromSpecificMedia"));
 }

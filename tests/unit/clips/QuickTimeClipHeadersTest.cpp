@@ -88,10 +88,10 @@ TEST_F(QuickTimeClipLoading, RecordsTheCountsAsTheyAreRead) {
     parser->AddTimecodeTrack(4);
     parser->AddOtherTrack(9);
     Load();
-    EXPECT_EQ(log->count("QuickTimeClip::CollectMediaInfo videoTrackCount: 1"), 1);
-    EXPECT_EQ(log->count("QuickTimeClip::CollectMediaInfo audioTrackCount: 0"), 1);
-    EXPECT_EQ(log->count("QuickTimeClip::CollectMediaInfo tcTrackCount: 2"), 1);
-    EXPECT_EQ(log->count("QuickTimeClip::CollectMediaInfo otherTrackCount: 1"), 1);
+    EXPECT_TRUE(log->once("QuickTimeClip::CollectMediaInfo videoTrackCount: 1"));
+    EXPECT_TRUE(log->once("QuickTimeClip::CollectMediaInfo audioTrackCount: 0"));
+    EXPECT_TRUE(log->once("QuickTimeClip::CollectMediaInfo tcTrackCount: 2"));
+    EXPECT_TRUE(log->once("QuickTimeClip::CollectMediaInfo otherTrackCount: 1"));
 }
 
 TEST_F(QuickTimeClipLoading, FeedsTheParserUntilItIsContent) {
@@ -153,9 +153,7 @@ TEST_F(QuickTimeClipLoading, EndsWhenTheParserAsksForNothing) {
     parser->script = {{QT_E_MOREDATA, 100, 0}};
     LoadVideo();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(
-        log->count(ReturnRecord("a000006f", "ParseMediaHeaders()", "QuickTimeClip::LoadClipImpl")),
-        1);
+    EXPECT_TRUE(log->returned("a000006f", "ParseMediaHeaders()", "QuickTimeClip::LoadClipImpl"));
 }
 
 TEST_F(QuickTimeClipLoading, EndsWhenTheParserGivesUp) {
@@ -163,9 +161,7 @@ TEST_F(QuickTimeClipLoading, EndsWhenTheParserGivesUp) {
     LoadVideo();
     EXPECT_FALSE(clip->IsLoaded());
     EXPECT_EQ(parser->fed.size(), 1u);
-    EXPECT_EQ(
-        log->count(ReturnRecord("8000000d", "ParseMediaHeaders()", "QuickTimeClip::LoadClipImpl")),
-        1);
+    EXPECT_TRUE(log->returned("8000000d", "ParseMediaHeaders()", "QuickTimeClip::LoadClipImpl"));
 }
 
 TEST_F(QuickTimeClipLoading, EndsWhenTheNextPositionIsRefused) {
@@ -173,10 +169,8 @@ TEST_F(QuickTimeClipLoading, EndsWhenTheNextPositionIsRefused) {
     parser->results["GetRecomendedReadPosition"] = NCF_E_FAIL;
     LoadVideo();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(
-        log->count(ReturnRecord("80000008", "qtParser_->GetRecomendedReadPosition(&pos, &readSize)",
-                                "QuickTimeClip::ParseMediaHeaders")),
-        1);
+    EXPECT_TRUE(log->returned("80000008", "qtParser_->GetRecomendedReadPosition(&pos, &readSize)",
+                              "QuickTimeClip::ParseMediaHeaders"));
 }
 
 TEST_F(QuickTimeClipLoading, EndsWhenTheParserAsksBehindTheEnd) {
@@ -184,10 +178,9 @@ TEST_F(QuickTimeClipLoading, EndsWhenTheParserAsksBehindTheEnd) {
     RecordingNMALog lines(1);
     LoadVideo();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(log->count(ReturnRecord(
-                  "a000006f", "file_reader.Read(pos, outputBuffer.get(), readSize, &bytesRead)",
-                  "QuickTimeClip::ParseMediaHeaders")),
-              1);
+    EXPECT_TRUE(log->returned("a000006f",
+                              "file_reader.Read(pos, outputBuffer.get(), readSize, &bytesRead)",
+                              "QuickTimeClip::ParseMediaHeaders"));
 }
 
 TEST_F(QuickTimeClipOfEmptyFile, EndsWithNoData) {
@@ -195,9 +188,7 @@ TEST_F(QuickTimeClipOfEmptyFile, EndsWithNoData) {
     LoadVideo();
     EXPECT_FALSE(clip->IsLoaded());
     EXPECT_TRUE(parser->fed.empty());
-    EXPECT_EQ(
-        log->count(ReturnRecord("a000006f", "ParseMediaHeaders()", "QuickTimeClip::LoadClipImpl")),
-        1);
+    EXPECT_TRUE(log->returned("a000006f", "ParseMediaHeaders()", "QuickTimeClip::LoadClipImpl"));
 }
 
 TEST_F(QuickTimeClipLoading, ThrowsWhenTheFileCannotBeOpened) {
@@ -216,11 +207,10 @@ TEST_F(QuickTimeClipLoading, StaysEmptyWithoutParser) {
     host->refuseCreation(NCFCompID_QTParser, NCF_E_OUTOFMEMORY);
     Load();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(log->count(ReturnRecord("80000002",
-                                      "componentFactory_->CreateComponent(NCFCompID_QTParser, "
-                                      "NULL, IID_IQTParser, (void **)&qtParser_)",
-                                      "QuickTimeClip::LoadClipImpl")),
-              1);
+    EXPECT_TRUE(log->returned("80000002",
+                              "componentFactory_->CreateComponent(NCFCompID_QTParser, "
+                              "NULL, IID_IQTParser, (void **)&qtParser_)",
+                              "QuickTimeClip::LoadClipImpl"));
 }
 
 TEST_F(QuickTimeClipLoading, ChecksItsThreeArgumentsInOrder) {
@@ -230,14 +220,14 @@ TEST_F(QuickTimeClipLoading, ChecksItsThreeArgumentsInOrder) {
     QuickTimeClip noFactory(nullptr, console, nullptr);
     QuickTimeClip noName(nullptr, console, factory);
     EXPECT_FALSE(nothing.IsLoaded());
-    EXPECT_EQ(log->count("CHK_PTR(console_)QuickTimeClip::LoadClipImpl"), 1);
-    EXPECT_EQ(log->count("CHK_PTR(componentFactory_)QuickTimeClip::LoadClipImpl"), 1);
-    EXPECT_EQ(log->count("CHK_PTR(fileName_.inArg())QuickTimeClip::LoadClipImpl"), 1);
+    EXPECT_TRUE(log->once("CHK_PTR(console_)QuickTimeClip::LoadClipImpl"));
+    EXPECT_TRUE(log->once("CHK_PTR(componentFactory_)QuickTimeClip::LoadClipImpl"));
+    EXPECT_TRUE(log->once("CHK_PTR(fileName_.inArg())QuickTimeClip::LoadClipImpl"));
     EXPECT_EQ(nothing.LoadClipImpl(), NCF_E_POINTER);
     EXPECT_EQ(nothing.SetFieldLayoutDetails(), NCF_E_POINTER);
-    EXPECT_EQ(log->count("CHK_PTR(console_)QuickTimeClip::SetFieldLayoutDetails"), 1);
+    EXPECT_TRUE(log->once("CHK_PTR(console_)QuickTimeClip::SetFieldLayoutDetails"));
     EXPECT_EQ(noName.SetFieldLayoutDetails(), NCF_E_POINTER);
-    EXPECT_EQ(log->count("CHK_PTR(qtParser_)QuickTimeClip::SetFieldLayoutDetails"), 1);
+    EXPECT_TRUE(log->once("CHK_PTR(qtParser_)QuickTimeClip::SetFieldLayoutDetails"));
 }
 
 TEST_F(QuickTimeClipLoading, DoesNothingWhenLoadedAlready) {
@@ -264,9 +254,9 @@ TEST_F(QuickTimeClipLoading, TellsTheUserOfAMovieWithoutPictureAndSound) {
     Load();
     EXPECT_FALSE(clip->IsLoaded());
     EXPECT_EQ(Console(1, "Movie doesn't contain any video/audio tracks!\n"), 1);
-    EXPECT_EQ(log->count("QuickTimeClip::LoadClipImplInitialization failed: No one audio/video "
-                         "tracks"),
-              1);
+    EXPECT_TRUE(
+        log->once("QuickTimeClip::LoadClipImplInitialization failed: No one audio/video "
+                  "tracks"));
     EXPECT_EQ(log->records().back().kind, slog::kWarning);
     EXPECT_EQ(clip->LoadClipImpl(), NMA_E_NODATA);
 }
@@ -332,8 +322,7 @@ TEST_F(QuickTimeClipLoading, StopsAtEveryFailingStep) {
         log->clear();
         Load();
         EXPECT_FALSE(clip->IsLoaded()) << step.operation;
-        EXPECT_EQ(log->count(ReturnRecord("80000009", step.expression, step.function)), 1)
-            << step.operation;
+        EXPECT_TRUE(log->returned("80000009", step.expression, step.function)) << step.operation;
     }
 }
 
@@ -343,17 +332,14 @@ TEST_F(QuickTimeClipLoading, StopsWhenWhatWorkedOnceFailsLater) {
     parser->results["GetVideoTrackCount"] = NCF_E_ABORT;
     Load();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "GetVideoTrackCount(&videoTrackCount)",
-                                      "QuickTimeClip::LoadClipImpl")),
-              1);
+    EXPECT_TRUE(log->returned("80000007", "GetVideoTrackCount(&videoTrackCount)",
+                              "QuickTimeClip::LoadClipImpl"));
     parser->results.clear();
     Picture().passes["GetDataFormat"] = 1;
     Picture().results["GetDataFormat"] = NCF_E_ABORT;
     Load();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(
-        log->count(ReturnRecord("80000007", "GetDataFormat(&fourCC)", "BaseClip::LoadClipBase")),
-        1);
+    EXPECT_TRUE(log->returned("80000007", "GetDataFormat(&fourCC)", "BaseClip::LoadClipBase"));
 }
 
 TEST_F(QuickTimeClipLoading, StopsWhenTheSoundCannotBeCountedAgain) {
@@ -363,9 +349,8 @@ TEST_F(QuickTimeClipLoading, StopsWhenTheSoundCannotBeCountedAgain) {
     Load();
     EXPECT_FALSE(clip->IsLoaded());
     EXPECT_TRUE(host->console().lines().empty());
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "GetAudioTrackCount(&audioTrackCount)",
-                                      "QuickTimeClip::LoadClipImpl")),
-              1);
+    EXPECT_TRUE(log->returned("80000007", "GetAudioTrackCount(&audioTrackCount)",
+                              "QuickTimeClip::LoadClipImpl"));
 }
 
 TEST_F(QuickTimeClipLoading, StopsWhenThePictureCannotBeRead) {
@@ -390,7 +375,7 @@ TEST_F(QuickTimeClipLoading, StopsWhenThePictureCannotBeRead) {
         log->clear();
         Load();
         EXPECT_FALSE(clip->IsLoaded()) << step.operation;
-        EXPECT_EQ(log->count(std::string("NCF_RETURN(0x8000ffff): ") + step.record), 1)
+        EXPECT_TRUE(log->once(std::string("NCF_RETURN(0x8000ffff): ") + step.record))
             << step.operation;
         const bool inBase = std::string(step.record).find("LoadClipImpl") == std::string::npos;
         EXPECT_EQ(log->count(ReturnRecord("8000ffff", "BaseClip::LoadClipBase()",
@@ -406,10 +391,8 @@ TEST_F(QuickTimeClipLoading, StopsWithoutSampleDescription) {
     Video().results["GetVideoSampleDescription"] = NCF_E_NOTFOUND;
     Load();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(
-        log->count(ReturnRecord("8000000c", "vti->GetVideoSampleDescription(0, vdscr.outArg())",
-                                "QuickTimeClip::LoadClipImpl")),
-        1);
+    EXPECT_TRUE(log->returned("8000000c", "vti->GetVideoSampleDescription(0, vdscr.outArg())",
+                              "QuickTimeClip::LoadClipImpl"));
 }
 
 // --- alpha ---------------------------------------------------------------------------
@@ -418,7 +401,7 @@ TEST_F(QuickTimeClipLoading, RecordsAlpha) {
     parser->AddVideoTrack(1);
     Picture().hasAlpha = 1;
     Load();
-    EXPECT_EQ(log->count("QuickTimeClip::LoadClipImplMovie has alpha!"), 1);
+    EXPECT_TRUE(log->once("QuickTimeClip::LoadClipImplMovie has alpha!"));
     EXPECT_FALSE(clip->ShowsAlpha()) << "the host ignores alpha until it says otherwise";
 }
 
@@ -444,10 +427,10 @@ TEST_F(QuickTimeClipLoading, LoadsWithoutHostSettingsAndIgnoresAlpha) {
     Load();
     EXPECT_TRUE(clip->IsLoaded());
     EXPECT_FALSE(clip->ShowsAlpha());
-    EXPECT_EQ(log->count("NCF_SKIP(0x80040111): componentFactory_->CreateComponent("
-                         "NMA::Impl::CompID_HostSettings, NULL, NMA::IID_IHostSettings, "
-                         "(void**)&hostSettings) : BaseClip::LoadClipBase"),
-              1);
+    EXPECT_TRUE(
+        log->once("NCF_SKIP(0x80040111): componentFactory_->CreateComponent("
+                  "NMA::Impl::CompID_HostSettings, NULL, NMA::IID_IHostSettings, "
+                  "(void**)&hostSettings) : BaseClip::LoadClipBase"));
 }
 
 TEST_F(QuickTimeClipLoading, LoadsWhenTheAlphaSettingWasNeverMade) {
@@ -457,10 +440,10 @@ TEST_F(QuickTimeClipLoading, LoadsWhenTheAlphaSettingWasNeverMade) {
     Load();
     EXPECT_TRUE(clip->IsLoaded());
     EXPECT_FALSE(clip->ShowsAlpha());
-    EXPECT_EQ(log->count("NCF_SKIP(0xa000006a): hostSettings->GetHostSettingBoolean("
-                         "NMA::NMAHostSetting_IgnoreAlpha, NMA::IHostSettings::kUserScope, "
-                         "&ignoreAlpha_) : BaseClip::LoadClipBase"),
-              1);
+    EXPECT_TRUE(
+        log->once("NCF_SKIP(0xa000006a): hostSettings->GetHostSettingBoolean("
+                  "NMA::NMAHostSetting_IgnoreAlpha, NMA::IHostSettings::kUserScope, "
+                  "&ignoreAlpha_) : BaseClip::LoadClipBase"));
 }
 
 TEST_F(QuickTimeClipLoading, WantsProofOfTheFamilysOwnAlpha) {
@@ -522,16 +505,15 @@ TEST_F(QuickTimeClipLoading, StopsWhenACodingCannotBeRead) {
     Picture().results["GetNivoAlphaCoding"] = NCF_E_FAIL;
     Load();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "vdscr->GetNivoAlphaCoding(i, &alphaCoding)",
-                                      "QuickTimeClip::LoadClipImpl")),
-              1);
+    EXPECT_TRUE(log->returned("80000008", "vdscr->GetNivoAlphaCoding(i, &alphaCoding)",
+                              "QuickTimeClip::LoadClipImpl"));
 }
 
 // --- records of the load -----------------------------------------------------------------
 
 TEST_F(QuickTimeClipLoading, RecordsWhatItFound) {
     LoadVideo();
-    EXPECT_EQ(log->count("BaseClip::GetEncodedWidthAndHeightwidth x height: 1920 x 1080"), 1);
-    EXPECT_EQ(log->count("BaseClip::GetImageAspectRatioimage_aspect_ratio: 16/9"), 1);
-    EXPECT_EQ(log->count("BaseClip::LoadClipBasecolor_space: CS_RGB"), 1);
+    EXPECT_TRUE(log->once("BaseClip::GetEncodedWidthAndHeightwidth x height: 1920 x 1080"));
+    EXPECT_TRUE(log->once("BaseClip::GetImageAspectRatioimage_aspect_ratio: 16/9"));
+    EXPECT_TRUE(log->once("BaseClip::LoadClipBasecolor_space: CS_RGB"));
 }

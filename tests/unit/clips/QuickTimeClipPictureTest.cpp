@@ -44,15 +44,13 @@ TEST_F(QuickTimeClipPicture, TellsFormatAndVendor) {
     EXPECT_EQ(code, 0x61766331u);
     EXPECT_EQ(clip->GetVendor(&code), NCF_OK);
     EXPECT_EQ(code, 0x6170706Cu);
-    EXPECT_EQ(log->count("QuickTimeClip::GetVendorvendor: appl"), 1);
+    EXPECT_TRUE(log->once("QuickTimeClip::GetVendorvendor: appl"));
     EXPECT_EQ(clip->GetDataFormat(nullptr), NCF_E_POINTER);
     EXPECT_EQ(clip->GetVendor(nullptr), NCF_E_POINTER);
     EXPECT_EQ(clip->GetNivoResolution(nullptr), NCF_E_POINTER);
     Picture().results["GetVendor"] = NCF_E_FAIL;
     EXPECT_EQ(clip->GetVendor(&code), NCF_E_FAIL);
-    EXPECT_EQ(log->count(
-                  ReturnRecord("80000008", "vdscr->GetVendor(vendor)", "QuickTimeClip::GetVendor")),
-              1);
+    EXPECT_TRUE(log->returned("80000008", "vdscr->GetVendor(vendor)", "QuickTimeClip::GetVendor"));
 }
 
 TEST_F(QuickTimeClipPicture, GivesTheFirstFieldOfTheResolution) {
@@ -89,7 +87,7 @@ TEST_F(QuickTimeClipPicture, RefusesAPictureWithoutSize) {
     Picture().width = 0;
     Load();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(log->count("NCFASSERT( width_ && height_ )BaseClip::GetEncodedWidthAndHeight"), 1);
+    EXPECT_TRUE(log->once("NCFASSERT( width_ && height_ )BaseClip::GetEncodedWidthAndHeight"));
     EXPECT_EQ(clip->LoadClipImpl(), NCF_E_FAIL);
 }
 
@@ -117,18 +115,17 @@ TEST_F(QuickTimeClipPicture, HandsAFailingFormatOn) {
     Picture().results["GetDataFormat"] = NCF_E_ABORT;
     ncfUInt32 code = 0;
     EXPECT_EQ(clip->GetDataFormat(&code), NCF_E_ABORT);
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "vdscr->GetDataFormat(dataFormat)",
-                                      "QuickTimeClip::GetDataFormat")),
-              1);
+    EXPECT_TRUE(log->returned("80000007", "vdscr->GetDataFormat(dataFormat)",
+                              "QuickTimeClip::GetDataFormat"));
 }
 
 TEST_F(QuickTimeClipPicture, RefusesAPictureWithoutRatio) {
     Picture().aspectDenominator = 0;
     Load();
     EXPECT_FALSE(clip->IsLoaded());
-    EXPECT_EQ(log->count("NCFASSERT( imageAspectRatioNumerator_ && imageAspectRatioDenominator_ )"
-                         "QuickTimeClip::GetImageAspectRatioImpl"),
-              1);
+    EXPECT_TRUE(
+        log->once("NCFASSERT( imageAspectRatioNumerator_ && imageAspectRatioDenominator_ )"
+                  "QuickTimeClip::GetImageAspectRatioImpl"));
 }
 
 // --- fields ------------------------------------------------------------------------------------
@@ -151,10 +148,8 @@ TEST_F(QuickTimeClipPicture, NeedsTheSizeWhereFieldsAreNotTold) {
     Load();
     Picture().results["GetEncodedWidthAndHeight"] = NCF_E_ABORT;
     EXPECT_EQ(clip->SetFieldLayoutDetails(), NCF_E_ABORT);
-    EXPECT_EQ(
-        log->count(ReturnRecord("80000007", "vdscr->GetEncodedWidthAndHeight(&width, &height)",
-                                "QuickTimeClip::SetFieldLayoutDetails")),
-        1);
+    EXPECT_TRUE(log->returned("80000007", "vdscr->GetEncodedWidthAndHeight(&width, &height)",
+                              "QuickTimeClip::SetFieldLayoutDetails"));
 }
 
 TEST_F(QuickTimeClipPicture, IsProgressiveWithOneField) {

@@ -19,6 +19,17 @@ protected:
         settings._forcedFrameRate = forcedRate;
         return settings;
     }
+    FakeAudioTrack& LoadSound() {
+        parser->AddAudioTrack(2);
+        Load();
+        return *parser->audioTracks[0];
+    }
+    // A picture track of 25 frames a second.
+    void LoadPictures() {
+        LoadVideo();
+        SetMedia(25, 1, 1);
+        RateOf();
+    }
     void SetMedia(ncfUInt64 samples, ncfUInt32 timescale, ncfUInt32 duration) {
         Video().table->numSamples = samples;
         Video().mediaTimescale = timescale;
@@ -46,7 +57,7 @@ TEST_F(QuickTimeClipTiming, SnapsTheMeanRateOfTheMedia) {
     LoadVideo();
     SetMedia(300, 2997, 30000);
     EXPECT_EQ(RateOf(), (Rational{30000, 1001}));
-    EXPECT_EQ(log->count("BaseClip::SetEditRateedit_rate: 30000/1001"), 1);
+    EXPECT_TRUE(log->once("BaseClip::SetEditRateedit_rate: 30000/1001"));
 }
 
 TEST_F(QuickTimeClipTiming, AveragesAVaryingRate) {
@@ -80,25 +91,22 @@ TEST_F(QuickTimeClipTiming, KeepsTheRateOfThePictureWhateverIsForced) {
 }
 
 TEST_F(QuickTimeClipTiming, TakesTheEditorsRateForSoundOnly) {
-    parser->AddAudioTrack(1);
-    Load();
+    LoadSound();
     EXPECT_EQ(RateOf(Settings(23.976)), (Rational{24000, 1001}));
     EXPECT_EQ(RateOf(Forced(25.0, 50.0)), (Rational{25, 1}));
 }
 
 TEST_F(QuickTimeClipTiming, TakesASlowEditorsRate) {
-    parser->AddAudioTrack(1);
-    Load();
+    LoadSound();
     EXPECT_EQ(RateOf(Settings(1.0)), (Rational{1, 1}));
     EXPECT_EQ(clip->SetEditRate(Settings(0.011)), NCF_OK) << "taken, though it rounds to nothing";
 }
 
 TEST_F(QuickTimeClipTiming, NeedsAnEditorsRateForSoundOnly) {
-    parser->AddAudioTrack(1);
-    Load();
+    LoadSound();
     Rational rate;
     EXPECT_EQ(clip->SetEditRate(EditorSettings()), NCF_E_UNEXPECTED);
-    EXPECT_EQ(log->count("QuickTimeClip::SetEditRateImplunknown edit rate!"), 1);
+    EXPECT_TRUE(log->once("QuickTimeClip::SetEditRateImplunknown edit rate!"));
     EXPECT_EQ(clip->GetEditRate(&rate), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(rate, (Rational{1, 1}));
 
@@ -111,8 +119,7 @@ TEST_F(QuickTimeClipTiming, NeedsAnEditorsRateForSoundOnly) {
 }
 
 TEST_F(QuickTimeClipTiming, KeepsTheFormerRateWhenTheEditorGivesNone) {
-    parser->AddAudioTrack(1);
-    Load();
+    LoadSound();
     ASSERT_EQ(RateOf(Settings(25.0)), (Rational{25, 1}));
     EXPECT_EQ(clip->SetEditRate(EditorSettings()), NCF_E_UNEXPECTED);
     Rational rate;
@@ -141,9 +148,8 @@ TEST_F(QuickTimeClipTiming, StopsAtEveryFailureOfTheRate) {
     for (const auto& step : steps) {
         step.calls->results[step.operation] = NCF_E_ABORT;
         EXPECT_EQ(clip->SetEditRate(EditorSettings()), NCF_E_ABORT) << step.operation;
-        EXPECT_EQ(log->count(ReturnRecord("80000007", step.expression,
-                                          "QuickTimeClip::SetAverageFrameRate")),
-                  1);
+        EXPECT_TRUE(
+            log->returned("80000007", step.expression, "QuickTimeClip::SetAverageFrameRate"));
         step.calls->results.clear();
     }
     EXPECT_EQ(log->count(ReturnRecord("80000007", "SetAverageFrameRate(editRate_)",
@@ -174,22 +180,18 @@ TEST_F(QuickTimeClipTiming, HasNoRateBelowHalfAFrameASecond) {
 // --- length -----------------------------------------------------------------------------
 
 TEST_F(QuickTimeClipTiming, RoundsTheLengthOfAPictureTrack) {
-    LoadVideo();
-    SetMedia(25, 1, 1);
-    RateOf();
+    LoadPictures();
     Video().linear = 0;
     Video().trackDuration = 12345;
     parser->timeScale = 1000;
     EXPECT_EQ(LengthOf(), 309u);
-    EXPECT_EQ(log->count("BaseClip::SetMovieLengthmovie_length[in_video_samples]: 309"), 1);
-    EXPECT_EQ(log->count("QuickTimeClip::SetAVMovieLengthtrack is not linear!"), 1);
+    EXPECT_TRUE(log->once("BaseClip::SetMovieLengthmovie_length[in_video_samples]: 309"));
+    EXPECT_TRUE(log->once("QuickTimeClip::SetAVMovieLengthtrack is not linear!"));
 }
 
 // 348/600 of a second is 14.5 frames, but the seconds are rounded first.
 TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfAPictureTrack) {
-    LoadVideo();
-    SetMedia(25, 1, 1);
-    RateOf();
+    LoadPictures();
     Video().linear = 1;
     Video().trackTimescale = 600;
     Video().trackDuration = 348;
@@ -198,8 +200,7 @@ TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfAPictureTrack
 
 // 696/600 of a second is 29 frames, but the seconds are rounded first.
 TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfSoundOnly) {
-    parser->AddAudioTrack(1);
-    Load();
+    LoadSound();
     RateOf(Settings(25.0));
     parser->duration = 696;
     parser->timeScale = 600;
@@ -207,8 +208,7 @@ TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfSoundOnly) {
 }
 
 TEST_F(QuickTimeClipTiming, CutsTheLengthOfSoundOnly) {
-    parser->AddAudioTrack(1);
-    Load();
+    LoadSound();
     RateOf(Settings(25.0));
     parser->duration = 12345;
     parser->timeScale = 1000;
@@ -216,9 +216,7 @@ TEST_F(QuickTimeClipTiming, CutsTheLengthOfSoundOnly) {
 }
 
 TEST_F(QuickTimeClipTiming, CountsALinearTrackInItsOwnScale) {
-    LoadVideo();
-    SetMedia(25, 1, 1);
-    RateOf();
+    LoadPictures();
     Video().linear = 1;
     Video().trackTimescale = 600;
     Video().trackDuration = 1200;
@@ -229,13 +227,11 @@ TEST_F(QuickTimeClipTiming, CountsALinearTrackInItsOwnScale) {
 }
 
 TEST_F(QuickTimeClipTiming, GoesOnWithTheMoviesScaleWhenLinearityCannotBeAsked) {
-    LoadVideo();
-    SetMedia(25, 1, 1);
-    RateOf();
+    LoadPictures();
     Video().results["IsTrackLinear"] = NCF_E_FAIL;
     Video().trackDuration = 2000;
     EXPECT_EQ(LengthOf(), 50u);
-    EXPECT_EQ(log->count("QuickTimeClip::SetAVMovieLengthIsTrackLinear failed: 0x80000008"), 1);
+    EXPECT_TRUE(log->once("QuickTimeClip::SetAVMovieLengthIsTrackLinear failed: 0x80000008"));
 }
 
 TEST_F(QuickTimeClipTiming, WorksTheLengthOutOnce) {
@@ -266,15 +262,12 @@ TEST_F(QuickTimeClipTiming, HandsFailuresOfTheLengthOn) {
     LoadVideo();
     Video().results["GetTrackDuration"] = NCF_E_ABORT;
     EXPECT_EQ(clip->SetMovieLength(EditorSettings()), NCF_E_ABORT);
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "vti->GetTrackDuration(&trackDuration)",
-                                      "QuickTimeClip::SetAVMovieLength")),
-              1);
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "SetAVMovieLength()",
-                                      "QuickTimeClip::SetMovieLengthImpl")),
-              1);
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "SetMovieLengthImpl(editorSettings)",
-                                      "BaseClip::SetMovieLength")),
-              1);
+    EXPECT_TRUE(log->returned("80000007", "vti->GetTrackDuration(&trackDuration)",
+                              "QuickTimeClip::SetAVMovieLength"));
+    EXPECT_TRUE(
+        log->returned("80000007", "SetAVMovieLength()", "QuickTimeClip::SetMovieLengthImpl"));
+    EXPECT_TRUE(log->returned("80000007", "SetMovieLengthImpl(editorSettings)",
+                              "BaseClip::SetMovieLength"));
     parser->results["GetTimeScale"] = NCF_E_FAIL;
     Video().linear = 0;
     EXPECT_EQ(clip->SetMovieLength(EditorSettings()), NCF_E_FAIL);
@@ -283,13 +276,11 @@ TEST_F(QuickTimeClipTiming, HandsFailuresOfTheLengthOn) {
 }
 
 TEST_F(QuickTimeClipTiming, HandsFailuresOfTheSoundOnlyLengthOn) {
-    parser->AddAudioTrack(1);
-    Load();
+    LoadSound();
     parser->results["GetMovieDuration"] = NCF_E_ABORT;
     EXPECT_EQ(clip->SetMovieLength(EditorSettings()), NCF_E_ABORT);
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "SetOnlyAudioMovieLength()",
-                                      "QuickTimeClip::SetMovieLengthImpl")),
-              1);
+    EXPECT_TRUE(log->returned("80000007", "SetOnlyAudioMovieLength()",
+                              "QuickTimeClip::SetMovieLengthImpl"));
     parser->results["GetTimeScale"] = NCF_E_FAIL;
     EXPECT_EQ(clip->SetMovieLength(EditorSettings()), NCF_E_FAIL);
 }
@@ -309,9 +300,7 @@ TEST_F(QuickTimeClipTiming, ChecksItsOutputs) {
 // --- sound in samples ---------------------------------------------------------------------
 
 TEST_F(QuickTimeClipTiming, CountsTheSamplesOfASoundTrack) {
-    parser->AddAudioTrack(2);
-    Load();
-    FakeAudioTrack& track = *parser->audioTracks[0];
+    FakeAudioTrack& track = LoadSound();
     track.trackDuration = 1001;
     parser->timeScale = 30000;
     ncfUInt64 samples = 0;
@@ -333,9 +322,7 @@ TEST_F(QuickTimeClipTiming, CountsTheSamplesOfASoundTrack) {
 
 // 23/600 of a second is 1690.5 samples, but the seconds are rounded first.
 TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheSamplesOfASoundTrack) {
-    parser->AddAudioTrack(2);
-    Load();
-    FakeAudioTrack& track = *parser->audioTracks[0];
+    FakeAudioTrack& track = LoadSound();
     track.description->rate = 44100.0;
     track.trackDuration = 23;
     parser->timeScale = 600;
@@ -350,9 +337,7 @@ TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheSamplesOfASoundTrack)
 }
 
 TEST_F(QuickTimeClipTiming, ReachesBeyondTheSignedRangeInSamples) {
-    parser->AddAudioTrack(2);
-    Load();
-    FakeAudioTrack& track = *parser->audioTracks[0];
+    FakeAudioTrack& track = LoadSound();
     track.trackDuration = 1u << 31;
     track.description->rate = 4294967296.0;
     parser->timeScale = 1;
@@ -362,8 +347,7 @@ TEST_F(QuickTimeClipTiming, ReachesBeyondTheSignedRangeInSamples) {
 }
 
 TEST_F(QuickTimeClipTiming, CountsNoSamplesWithoutTimeScale) {
-    parser->AddAudioTrack(2);
-    Load();
+    LoadSound();
     parser->timeScale = 0;
     ncfUInt64 samples = 5;
     EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(2, &samples), NCF_OK);
@@ -371,14 +355,12 @@ TEST_F(QuickTimeClipTiming, CountsNoSamplesWithoutTimeScale) {
 }
 
 TEST_F(QuickTimeClipTiming, HandsFailuresOfTheSampleCountOn) {
-    parser->AddAudioTrack(2);
-    Load();
+    FakeAudioTrack& track = LoadSound();
     ncfUInt64 samples = 5;
     EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(2, nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(2, nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(99, &samples), NCF_E_NOTFOUND);
     EXPECT_EQ(samples, 0u);
-    FakeAudioTrack& track = *parser->audioTracks[0];
     track.results["GetTrackDuration"] = NCF_E_ABORT;
     EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(2, &samples), NCF_E_ABORT);
     track.results = {{"GetMediaDuration", NCF_E_ABORT}};
@@ -390,7 +372,6 @@ TEST_F(QuickTimeClipTiming, HandsFailuresOfTheSampleCountOn) {
     EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(2, &samples), NCF_E_FAIL);
     track.descriptionCount = 2;
     EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(2, &samples), NCF_E_NOTFOUND);
-    EXPECT_EQ(log->count(ReturnRecord("8000000c", "GetAudioTrackMetadata(qtTrack, &audioInfo)",
-                                      "QuickTimeClip::CalculateAudioTrackLengthInSamples")),
-              1);
+    EXPECT_TRUE(log->returned("8000000c", "GetAudioTrackMetadata(qtTrack, &audioInfo)",
+                              "QuickTimeClip::CalculateAudioTrackLengthInSamples"));
 }

@@ -100,7 +100,7 @@ TEST_F(QuickTimeClipTracks, TellsTheKindOfATrack) {
     EXPECT_EQ(type, 3u);
     EXPECT_EQ(clip->GetTrackType(77, &type), NCF_E_NOTFOUND);
     EXPECT_EQ(clip->GetTrackType(3, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count("CHK_INARG(trackType)QuickTimeClip::GetTrackType"), 1);
+    EXPECT_TRUE(log->once("CHK_INARG(trackType)QuickTimeClip::GetTrackType"));
 }
 
 TEST_F(QuickTimeClipTracks, CountsItsTracks) {
@@ -151,11 +151,9 @@ TEST_F(QuickTimeClipTracks, HandsOutTracksByTheirKind) {
     EXPECT_EQ(video.inArg(), parser->videoTracks[1]);
 
     EXPECT_EQ(clip->GetAudioTrack(3, audio.outArg()), NCF_E_NOINTERFACE);
-    EXPECT_EQ(
-        log->count(ReturnRecord(
-            "80000004", "trackInfo->QueryInterface(IID_IAudioTrackInfo, (void**)audioTrackInfo)",
-            "QuickTimeClip::GetAudioTrack")),
-        1);
+    EXPECT_TRUE(log->returned(
+        "80000004", "trackInfo->QueryInterface(IID_IAudioTrackInfo, (void**)audioTrackInfo)",
+        "QuickTimeClip::GetAudioTrack"));
     EXPECT_EQ(clip->GetVideoTrack(8, video.outArg()), NCF_E_NOINTERFACE);
     EXPECT_EQ(clip->GetTrackInfo(99, any.outArg()), NCF_E_NOTFOUND);
     EXPECT_EQ(clip->GetAudioTrack(99, audio.outArg()), NCF_E_NOTFOUND);
@@ -286,26 +284,20 @@ TEST_F(QuickTimeClipTracks, HandsFailuresOfTheSoundTrackOn) {
     EXPECT_EQ(clip->GetAudioTrackMetadata(8, nullptr), NCF_E_POINTER);
     EXPECT_EQ(clip->IsAudioLPCM(8, nullptr), NCF_E_POINTER);
     EXPECT_EQ(clip->GetAudioTrackMetadata(99, &info), NCF_E_NOTFOUND);
-    EXPECT_EQ(log->count(ReturnRecord("8000000c", "GetAudioTrack(qtTrack, ati.outArg())",
-                                      "QuickTimeClip::GetAudioTrackMetadata")),
-              1);
+    EXPECT_TRUE(log->returned("8000000c", "GetAudioTrack(qtTrack, ati.outArg())",
+                              "QuickTimeClip::GetAudioTrackMetadata"));
     track.results["GetSampleDescriptionCount"] = NCF_E_FAIL;
     EXPECT_EQ(clip->GetAudioTrackMetadata(8, &info), NCF_E_FAIL);
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "ati->GetSampleDescriptionCount(&count)",
-                                      "QuickTimeClip::GetAudioTrackMetadata")),
-              1);
+    EXPECT_TRUE(log->returned("80000008", "ati->GetSampleDescriptionCount(&count)",
+                              "QuickTimeClip::GetAudioTrackMetadata"));
     track.results = {{"GetAudioSampleDescription", NCF_E_ABORT}};
     EXPECT_EQ(clip->IsAudioLPCM(8, &isLPCM), NCF_E_ABORT);
-    EXPECT_EQ(
-        log->count(ReturnRecord("80000007", "ati->GetAudioSampleDescription(0, adscr.outArg())",
-                                "QuickTimeClip::IsAudioLPCM")),
-        1);
+    EXPECT_TRUE(log->returned("80000007", "ati->GetAudioSampleDescription(0, adscr.outArg())",
+                              "QuickTimeClip::IsAudioLPCM"));
     track.results.clear();
     track.description->results["IsLPCM"] = NCF_E_ABORT;
     EXPECT_EQ(clip->IsAudioLPCM(8, &isLPCM), NCF_E_ABORT);
-    EXPECT_EQ(
-        log->count(ReturnRecord("80000007", "adscr->IsLPCM(isLPCM)", "QuickTimeClip::IsAudioLPCM")),
-        1);
+    EXPECT_TRUE(log->returned("80000007", "adscr->IsLPCM(isLPCM)", "QuickTimeClip::IsAudioLPCM"));
 }
 
 TEST_F(QuickTimeClipTracks, AsksTheDescriptionWhetherSoundIsLinear) {
@@ -347,9 +339,8 @@ TEST_F(QuickTimeClipTracks, ForwardsTheCreationTime) {
     EXPECT_EQ(clip->GetCreationTime(nullptr), NCF_E_POINTER);
     parser->results["GetCreationTime"] = NCF_E_FAIL;
     EXPECT_EQ(clip->GetCreationTime(&time), NCF_E_FAIL);
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "qtParser_->GetCreationTime(creationTime)",
-                                      "QuickTimeClip::GetCreationTime")),
-              1);
+    EXPECT_TRUE(log->returned("80000008", "qtParser_->GetCreationTime(creationTime)",
+                              "QuickTimeClip::GetCreationTime"));
 }
 
 TEST_F(QuickTimeClipTracks, ReturnsTheSelfContainedFlagItself) {
@@ -407,9 +398,9 @@ TEST_F(QuickTimeClipTracks, KnowsNothingOfThePictureOfASoundOnlyMovie) {
     EXPECT_EQ(clip->GetNivoResolution(&number), NCF_E_POINTER);
     EXPECT_EQ(clip->GetNMAFrameLayout(&number), NCF_E_POINTER);
     EXPECT_EQ(clip->SetFieldLayoutDetails(), NCF_E_POINTER);
-    EXPECT_EQ(log->count("CHK_PTR(vti.inArg())QuickTimeClip::GetDataFormat"), 1);
+    EXPECT_TRUE(log->once("CHK_PTR(vti.inArg())QuickTimeClip::GetDataFormat"));
     EXPECT_EQ(clip->GetImageAspectRatio(&number, &number), NCF_E_POINTER);
-    EXPECT_EQ(log->count("CHK_PTR(vti)QuickTimeClip::GetImageAspectRatioImpl"), 1);
+    EXPECT_TRUE(log->once("CHK_PTR(vti)QuickTimeClip::GetImageAspectRatioImpl"));
 }
 
 // --- samples
@@ -494,9 +485,8 @@ TEST_F(QuickTimeClipTracks, HandsTheTablesAnswerOnUnlogged) {
     EXPECT_EQ(clip->DisplayTimeToFrameNum(2, 1, &wide), NCF_E_ABORT);
     EXPECT_TRUE(log->records().empty());
     EXPECT_EQ(clip->GetDataOffset(99, 1, &wide), NCF_E_NOTFOUND);
-    EXPECT_EQ(log->count(ReturnRecord("8000000c", "GetSampleTable(qtTrack, sampleTable.outArg())",
-                                      "QuickTimeClip::GetDataOffset")),
-              1);
+    EXPECT_TRUE(log->returned("8000000c", "GetSampleTable(qtTrack, sampleTable.outArg())",
+                              "QuickTimeClip::GetDataOffset"));
 }
 
 // --- names
@@ -527,29 +517,25 @@ TEST_F(QuickTimeClipTracks, AsksThePropertyComponentForOtherNames) {
     EXPECT_EQ(clip->GetCodecName(0x61766331, name), NCF_OK);
     EXPECT_EQ(host->creations(QuickTime::CompID_QuickTimeProperty), 1) << "made once";
     EXPECT_EQ(clip->GetCodecName(0, name), NCF_E_INVALIDARG);
-    EXPECT_EQ(
-        log->count(ReturnRecord("80000003", "quickTimeProperty->GetCodecName(codecType, codecName)",
-                                "QuickTimeClip::GetCodecName")),
-        1);
+    EXPECT_TRUE(log->returned("80000003", "quickTimeProperty->GetCodecName(codecType, codecName)",
+                              "QuickTimeClip::GetCodecName"));
 }
 
 TEST_F(QuickTimeClipTracks, HandsRefusedServicesOnWithTheirText) {
     LoadVideo();
     NCFSmartPtr<INCFString> name;
     EXPECT_EQ(clip->GetCodecName(0x61766331, name), NCF_CLASS_E_CLASSNOTAVAILABLE);
-    EXPECT_EQ(log->count(ReturnRecord("80040111",
-                                      "(componentFactory_.inArg())->CreateComponent("
-                                      "QuickTime::CompID_QuickTimeProperty, NULL, "
-                                      "QuickTime::IID_IQuickTimeProperty, (void**)&qtProperty_)",
-                                      "BaseClip::GetQuickTimePropertyComponent")),
-              1);
+    EXPECT_TRUE(log->returned("80040111",
+                              "(componentFactory_.inArg())->CreateComponent("
+                              "QuickTime::CompID_QuickTimeProperty, NULL, "
+                              "QuickTime::IID_IQuickTimeProperty, (void**)&qtProperty_)",
+                              "BaseClip::GetQuickTimePropertyComponent"));
     host->refuseCreation(NCFCompID_NCFString, NCF_E_OUTOFMEMORY);
     EXPECT_EQ(clip->GetCodecName(0x61766331, name), NCF_E_OUTOFMEMORY);
     EXPECT_TRUE(name.isNull());
-    EXPECT_EQ(log->count(ReturnRecord("80000002",
-                                      "(componentFactory_.inArg())->CreateComponent("
-                                      "NCFCompID_NCFString, 0, IID_PPV_ARG(INCFString, "
-                                      "&codecName))",
-                                      "QuickTimeClip::GetCodecName")),
-              1);
+    EXPECT_TRUE(log->returned("80000002",
+                              "(componentFactory_.inArg())->CreateComponent("
+                              "NCFCompID_NCFString, 0, IID_PPV_ARG(INCFString, "
+                              "&codecName))",
+                              "QuickTimeClip::GetCodecName"));
 }

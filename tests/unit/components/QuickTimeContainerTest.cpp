@@ -8,9 +8,9 @@
 #include "host_interfaces/aaf/AAFMasterMobs.h"
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFMobs.h"
-#include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "tests/support/fakes/FakeLock.h"
+#include "tests/support/fakes/StubSampleMapping.h"
 #include "tests/support/movies/Movie.h"
 #include "tests/unit/components/ComponentFixture.h"
 
@@ -26,46 +26,6 @@ public:
 
 private:
     ncfUInt32 value_;
-};
-
-// A mapping of another make, which answers nothing.
-class ForeignMapping : public FakeObject<NMA::ISampleMapping> {
-public:
-    ncfSInt32 GetNumberOfTracks() override { return 0; }
-    NCFRESULT GetNumberOfChannels(ncfUInt32, ncfUInt32*) override { return kNo; }
-    NCFRESULT GetNumberOfSamples(ncfUInt32, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetSampleStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetSampleSize(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetSamplePosition(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetSampleTemporalOffset(ncfUInt32, ncfUInt64, ncfSInt64*) override { return kNo; }
-    NCFRESULT GetSampleProperties(ncfUInt32, ncfUInt64, ncfUInt64*, ncfUInt32*) override {
-        return kNo;
-    }
-    NCFRESULT GetSampleDependency(ncfUInt32, ncfUInt64, ncfUInt32, ncfSInt64*) override {
-        return kNo;
-    }
-    NCFRESULT GetNumberOfEncodedUnits(ncfUInt32, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetEncodedUnitStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetEncodedUnitPosition(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetEncodedUnitSize(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetEncodedUnitSizeInSamples(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetEncodedUnitFirstSample(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetEncodedUnitContainingSample(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return kNo;
-    }
-    NCFRESULT GetNumberOfContiguousSamples(ncfUInt32, ncfUInt64, ncfSInt64*) override {
-        return kNo;
-    }
-    NCFRESULT GetNumberOfContiguousBytes(ncfUInt32, ncfUInt64, ncfUInt64*) override { return kNo; }
-    NCFRESULT GetNumberOfContiguousEncodedUnits(ncfUInt32, ncfUInt64, ncfSInt64*) override {
-        return kNo;
-    }
-    NCFRESULT RegisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override { return kNo; }
-    NCFRESULT UnregisterSampleRangeHint(ncfUInt32, ncfUInt64, ncfUInt64) override { return kNo; }
-    NCFRESULT SetStorageCallback(INCFUnknown*) override { return kNo; }
-
-private:
-    static constexpr NCFRESULT kNo = NCF_E_NOTIMPL;
 };
 
 // A container that the host's own header parser serves.
@@ -226,7 +186,7 @@ TEST_F(Container, PathWithAPercentSignIsNoFormat) {
 TEST_F(Container, RecordsItsPath) {
     RecordingLog log(host);
     container()->SetFilePath(text("C:/a.mov").inArg());
-    EXPECT_EQ(log.count("NMA::Impl::QuickTimeContainer::SetFilePathC:\\a.mov"), 1);
+    EXPECT_TRUE(log.once("NMA::Impl::QuickTimeContainer::SetFilePathC:\\a.mov"));
 }
 
 // A string that answers a copy, or refuses it.
@@ -292,10 +252,9 @@ TEST_F(Container, RecordsAPathThatCanNotBeTurnedOrRead) {
     const std::string function = " : NMA::Impl::QuickTimeContainer::SetFilePath";
     RecordingLog log(host);
     EXPECT_EQ(failing(NCF_E_OUTOFMEMORY), NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(log.count("NCF_RETURN(0x80000002): ConvertSlashesInPlace(filePath_)" + function), 1);
+    EXPECT_TRUE(log.once("NCF_RETURN(0x80000002): ConvertSlashesInPlace(filePath_)" + function));
     EXPECT_EQ(failing(NCF_OK), NCF_E_ABORT);
-    EXPECT_EQ(log.count("NCF_RETURN(0x80000007): filePath_->GetRawWCHAR(&ppwcharStr)" + function),
-              1);
+    EXPECT_TRUE(log.once("NCF_RETURN(0x80000007): filePath_->GetRawWCHAR(&ppwcharStr)" + function));
 }
 
 // --- description -----------------------------------------------------------------------
@@ -427,11 +386,11 @@ TEST_F(Container, GivesTheFailureToMakeAMapping) {
     auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
     EXPECT_EQ(object->GetSampleMapping(&mapping), NCF_CLASS_E_CLASSNOTAVAILABLE);
     EXPECT_EQ(mapping, nullptr);
-    EXPECT_EQ(log.count("NCF_RETURN(0x80040111): "
-                        "componentFactory_->CreateComponent(NMA::CompID_QuickTimeSampleMapping, "
-                        "NULL, IID_ISampleMapping, (void**)ppSampleMapping) : "
-                        "NMA::Impl::QuickTimeContainer::GetSampleMapping"),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_RETURN(0x80040111): "
+                 "componentFactory_->CreateComponent(NMA::CompID_QuickTimeSampleMapping, "
+                 "NULL, IID_ISampleMapping, (void**)ppSampleMapping) : "
+                 "NMA::Impl::QuickTimeContainer::GetSampleMapping"));
 }
 
 TEST_F(Container, TellsTheUserOfAMappingThatIsNotTheModulesOwn) {
@@ -451,7 +410,7 @@ TEST_F(Container, TellsTheUserOfAMappingThatIsNotTheModulesOwn) {
     });
     refused();
     host.maker(NMA::CompID_QuickTimeSampleMapping, [](const GUID&, void** out) {
-        *out = static_cast<NMA::ISampleMapping*>(new ForeignMapping);
+        *out = static_cast<NMA::ISampleMapping*>(new StubSampleMapping);
         return NCF_OK;
     });
     refused();
@@ -467,10 +426,10 @@ TEST_F(Container, MappingOfAFileThatIsNoMovieFailsAndLeavesNothing) {
     auto* mapping = reinterpret_cast<NMA::ISampleMapping*>(&host);
     EXPECT_EQ(object->GetSampleMapping(&mapping), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(mapping, nullptr);
-    EXPECT_EQ(log.count("NCF_RETURN(0xa0000068): LoadMedia(filePath_, console_, "
-                        "componentFactory_, media_) : "
-                        "NMA::Impl::QuickTimeContainer::GetSampleMapping"),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_RETURN(0xa0000068): LoadMedia(filePath_, console_, "
+                 "componentFactory_, media_) : "
+                 "NMA::Impl::QuickTimeContainer::GetSampleMapping"));
     // The clip that failed is kept, so the next mapping stands over that one.
     ASSERT_EQ(object->GetSampleMapping(&mapping), NCF_OK);
     EXPECT_EQ(host.creations(NCFCompID_QTParser), 1);

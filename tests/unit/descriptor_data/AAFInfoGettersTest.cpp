@@ -243,10 +243,10 @@ TEST_F(AAFInfoGettersTest, ProfileAndLevelAbsentIsNotAvailable) {
     ncfUInt8 value = 0x55;
     EXPECT_EQ(reader.GetProfileAndLevelFromVCID(&value), NCF_E_PARAMETERNOTAVAILABLE);
     EXPECT_EQ(value, 0x55);
-    EXPECT_EQ(log.count("NCF_RETURN(0xa000006a): GetOneProperty(profileAndLevelNameString, "
-                        "&profileAndLevelValueString) : "
-                        "AAFInfoDataContainerReader2::GetProfileAndLevelFromVCID"),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_RETURN(0xa000006a): GetOneProperty(profileAndLevelNameString, "
+                 "&profileAndLevelValueString) : "
+                 "AAFInfoDataContainerReader2::GetProfileAndLevelFromVCID"));
 }
 
 TEST_F(AAFInfoGettersTest, TheLineMapAppendsInFileOrder) {

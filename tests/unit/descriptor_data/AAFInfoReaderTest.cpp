@@ -181,7 +181,7 @@ TEST_F(AAFInfoReaderTest, EveryQuestionLogsAFailedSearch) {
     for (const char* name :
          {"GetUID", "GetOneProperty", "GetTwoProperties", "IsDescriptorMPEG2", "IsDescriptorRGBA",
           "GetVideoLineMapFromVCID", "GetPixelLayoutFromVCID"}) {
-        EXPECT_EQ(log.count(text1 + name), 1) << name;
+        EXPECT_TRUE(log.once(text1 + name)) << name;
     }
 }
 
@@ -201,7 +201,7 @@ TEST_F(AAFInfoReaderTest, MissingOutputsAreRefusedUnderTheirNames) {
           "CHK_INARG(outPixelLayoutVect)AAFInfoDataContainerReader2::GetPixelLayoutFromVCID",
           "CHK_PTR(elementValue)AAFInfoDataContainerReader2::GetOneProperty",
           "CHK_INARG(outUID)GetUIDImpl"}) {
-        EXPECT_EQ(log.count(text), 1) << text;
+        EXPECT_TRUE(log.once(text)) << text;
     }
 }
 
@@ -217,7 +217,7 @@ TEST_F(AAFInfoReaderTest, TheImplsRefuseAMissingDescriptorUnderTheirNames) {
                                "CHK_INARG(pMediaDescriptorNode)GetOnePropertyImpl",
                                "CHK_INARG(elementValue1)GetTwoPropertiesImpl",
                                "CHK_INARG(elementValue2)GetTwoPropertiesImpl"}) {
-        EXPECT_EQ(log.count(record), 1) << record;
+        EXPECT_TRUE(log.once(record)) << record;
     }
 }
 

@@ -80,8 +80,8 @@ protected:
 TEST_F(ContainerTest, RefusesMissingNodesUnderTheirNames) {
     EXPECT_EQ(container_.CreateDescriptionNode("x", DCF_ELEMENT, nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(container_.SetContainerDescription(nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log.count("CHK_INARG(node)GenericXMLDataContainer::CreateDescriptionNode"), 1);
-    EXPECT_EQ(log.count("CHK_INARG(parent)GenericXMLDataContainer::SetContainerDescription"), 1);
+    EXPECT_TRUE(log.once("CHK_INARG(node)GenericXMLDataContainer::CreateDescriptionNode"));
+    EXPECT_TRUE(log.once("CHK_INARG(parent)GenericXMLDataContainer::SetContainerDescription"));
 }
 
 TEST_F(ContainerTest, OperationsStandInTheirPlaces) {

@@ -49,7 +49,7 @@ TEST_F(XMLParserHelpersTest, TheDocumentHandlerTakesMessagesToo) {
     };
     EXPECT_EQ(Parse(), NCF_OK);
     EXPECT_NE(seen, nullptr);
-    EXPECT_EQ(log.count("NMA::Impl::GenericDocHandler::Warningmessage"), 1);
+    EXPECT_TRUE(log.once("NMA::Impl::GenericDocHandler::Warningmessage"));
 }
 
 TEST_F(XMLParserHelpersTest, WithoutParserTheCreationIsLogged) {

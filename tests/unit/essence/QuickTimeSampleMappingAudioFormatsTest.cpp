@@ -32,11 +32,10 @@ TEST_F(AudioFormats, CountsUnderTheLock) {
 TEST_F(AudioFormats, CountNeedsAnOutputThenASoundTrack) {
     ncfUInt32 count = 77;
     EXPECT_EQ(mapping->GetNumberOfAudioFormats(9, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(numFormats)", "GetNumberOfAudioFormats")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(numFormats)", "GetNumberOfAudioFormats")));
     EXPECT_EQ(mapping->GetNumberOfAudioFormats(9, &count), NCF_E_INVALIDARG);
-    EXPECT_EQ(
-        log->count(Record("80000003", "GetMediaTrack(trackNMA, track)", "GetNumberOfAudioFormats")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000003", "GetMediaTrack(trackNMA, track)", "GetNumberOfAudioFormats")));
     log->clear();
     EXPECT_EQ(mapping->GetNumberOfAudioFormats(0, &count), NCF_E_INVALIDARG);
     EXPECT_TRUE(log->records().empty()) << "a picture is refused silently";
@@ -64,16 +63,15 @@ TEST_F(AudioFormats, NullOutputOutranksABadTrack) {
     EXPECT_EQ(mapping->GetAudioFormat(9, 0, &format, nullptr, nullptr), NCF_E_INVALIDARG);
     EXPECT_EQ(mapping->GetAudioFormat(9, 0, &format, &bytes, nullptr), NCF_E_INVALIDARG);
     for (const char* name : {"sampleFormat", "bytesPerSample", "bitsPerSample"}) {
-        EXPECT_EQ(log->count(Check(std::string("CHK_INARG(") + name + ")", "GetAudioFormat")), 1);
+        EXPECT_TRUE(log->once(Check(std::string("CHK_INARG(") + name + ")", "GetAudioFormat")));
     }
     EXPECT_FALSE(log->contains("GetMediaTrack"));
     EXPECT_EQ(mapping->GetAudioFormat(9, 0, &format, &bytes, &bits), NCF_E_INVALIDARG);
     EXPECT_TRUE(log->contains("GetMediaTrack(trackNMA, track)"));
     EXPECT_EQ(mapping->GetAudioFormat(0, 0, &format, &bytes, &bits), NCF_E_INVALIDARG);
     EXPECT_EQ(mapping->GetAudioFormat(1, 2, &format, &bytes, &bits), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003", "track->GetMediaFormat(formatIndex, mediaFormat)",
-                                "GetAudioFormat")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000003", "track->GetMediaFormat(formatIndex, mediaFormat)", "GetAudioFormat")));
     EXPECT_EQ(format, 77u);
 }
 
@@ -83,9 +81,9 @@ TEST_F(AudioFormats, FormatOfAnotherKindIsRefused) {
     ncfUInt16 bytes = 77;
     ncfUInt16 bits = 77;
     EXPECT_EQ(mapping->GetAudioFormat(1, 2, &format, &bytes, &bits), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(audio_format)", "GetAudioFormat")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(audio_format)", "GetAudioFormat")));
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 2), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(audio_format)", "SetWorkingAudioFormat")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(audio_format)", "SetWorkingAudioFormat")));
 }
 
 TEST_F(AudioFormats, ChoiceTellsTheReaderAndKeepsItsChannelCount) {
@@ -125,18 +123,17 @@ TEST_F(AudioFormats, ReaderWithoutChannelsIsRefused) {
     wrapper->sound->channels = 0;
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 0), NCF_E_FAIL);
     EXPECT_EQ(Channels(1), 1u);
-    EXPECT_EQ(log->count(Record("80000008", "audio_track->SetNumberAudioChannels(numAudioChannels)",
-                                "SetWorkingAudioFormat")),
-              1);
+    EXPECT_TRUE(
+        log->once(Record("80000008", "audio_track->SetNumberAudioChannels(numAudioChannels)",
+                         "SetWorkingAudioFormat")));
 }
 
 TEST_F(AudioFormats, ChoicePastTheEndLeavesTheIndexChanged) {
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 5), NCF_E_INVALIDARG);
     EXPECT_EQ(mapping->mediaTracks_[1]->GetSelectedIndex(), 5u);
     EXPECT_FALSE(mapping->mediaTracks_[1]->GetSelectedFormat());
-    EXPECT_EQ(log->count(Record("80000003", "track->GetMediaFormat(formatIndex, mediaFormat)",
-                                "SetWorkingAudioFormat")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000003", "track->GetMediaFormat(formatIndex, mediaFormat)",
+                                 "SetWorkingAudioFormat")));
     EXPECT_EQ(journal.startingWith("sound.").size(), 0u);
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 1), NCF_OK);
     EXPECT_FALSE(mapping->mediaTracks_[1]->GetSelectedFormat()) << "never set for sound";
@@ -146,9 +143,8 @@ TEST_F(AudioFormats, ChoiceNeedsASoundTrackBeforeTheLock) {
     EXPECT_EQ(mapping->SetWorkingAudioFormat(0, 0), NCF_E_INVALIDARG);
     EXPECT_TRUE(log->records().empty());
     EXPECT_EQ(mapping->SetWorkingAudioFormat(9, 0), NCF_E_INVALIDARG);
-    EXPECT_EQ(
-        log->count(Record("80000003", "GetMediaTrack(trackNMA, track)", "SetWorkingAudioFormat")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000003", "GetMediaTrack(trackNMA, track)", "SetWorkingAudioFormat")));
     EXPECT_TRUE(journal.lines().empty());
 }
 
@@ -180,7 +176,7 @@ TEST_F(AudioFormats, ChoiceGivesTheFailureOfEachStep) {
         {"80000008", "AAFTrackToQuickTimeTrack(trackNMA, &trackQT)"},
     };
     for (const auto& text : texts) {
-        EXPECT_EQ(log->count(Record(text.first, text.second, "SetWorkingAudioFormat")), 1)
+        EXPECT_TRUE(log->once(Record(text.first, text.second, "SetWorkingAudioFormat")))
             << text.second;
     }
     EXPECT_EQ(Channels(1), 1u);
@@ -190,7 +186,7 @@ using AudioFormatsBeforeTheQuery = MappingFixture;
 
 TEST_F(AudioFormatsBeforeTheQuery, ChoiceNeedsTheReaderFirst) {
     EXPECT_EQ(mapping->SetWorkingAudioFormat(9, 0), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(_audioReaderHolder)", "SetWorkingAudioFormat")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(_audioReaderHolder)", "SetWorkingAudioFormat")));
 }
 
 }  // namespace

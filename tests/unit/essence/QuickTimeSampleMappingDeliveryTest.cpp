@@ -58,7 +58,7 @@ TEST_F(Delivery, NeedsARequest) {
     Movie({kBGRAPixelFormat});
     journal.clear();
     EXPECT_EQ(mapping->ProvideSampleRange(nullptr, 0), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(pAVBuffer)", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(pAVBuffer)", "ProvideSampleRange")));
     EXPECT_TRUE(journal.lines().empty()) << "before the lock";
 }
 
@@ -70,12 +70,11 @@ TEST_F(Delivery, GivesTheFailureOfTheRequestUnderTheLock) {
     EXPECT_EQ(journal.lines(), (Lines{"lock", "request.GetSampleRange", "unlock"}));
     request->results = {{"GetBuffer", NCF_E_HANDLE}};
     EXPECT_EQ(Ask(0), NCF_E_HANDLE);
-    EXPECT_EQ(
-        log->count(Record("80000007", "pAVBuffer->GetSampleRange(&trackNMA, &sample, &numSamples)",
-                          "ProvideSampleRange")),
-        1);
-    EXPECT_EQ(
-        log->count(Record("80000006", "pAVBuffer->GetBuffer(&pBuffer)", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(
+        log->once(Record("80000007", "pAVBuffer->GetSampleRange(&trackNMA, &sample, &numSamples)",
+                         "ProvideSampleRange")));
+    EXPECT_TRUE(
+        log->once(Record("80000006", "pAVBuffer->GetBuffer(&pBuffer)", "ProvideSampleRange")));
 }
 
 TEST_F(Delivery, RequestWithoutABufferIsRefused) {
@@ -92,8 +91,8 @@ TEST_F(Delivery, RequestWithoutABufferIsRefused) {
 TEST_F(Delivery, TrackThatIsNotThereIsInvalid) {
     Movie({kBGRAPixelFormat});
     EXPECT_EQ(Ask(9), NCF_E_INVALIDARG);
-    EXPECT_EQ(
-        log->count(Record("80000003", "GetMediaTrack(trackNMA, track)", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(
+        log->once(Record("80000003", "GetMediaTrack(trackNMA, track)", "ProvideSampleRange")));
 }
 
 // --- pictures ---------------------------------------------------------------------------------
@@ -201,7 +200,7 @@ TEST_F(Delivery, FrameOfUnknownSizeFailsBeforeTheBuffer) {
     Movie({kBGRAPixelFormat});
     Choose(0, 0);
     EXPECT_EQ(Ask(0, 99), NCF_E_FAIL);
-    EXPECT_EQ(log->count(Check("NCFASSERT( nQuickTimeBufSize )", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(log->once(Check("NCFASSERT( nQuickTimeBufSize )", "ProvideSampleRange")));
     EXPECT_TRUE(journal.startingWith("buffer.").empty());
 }
 
@@ -297,10 +296,9 @@ TEST_F(Delivery, FormatsThatAreNotDefinedAreAssertedAfterTheRead) {
     Choose(0, 2);
     EXPECT_EQ(Ask(0), NCF_E_FAIL);
     EXPECT_EQ(journal.count("reader.ReadFrame 0 0"), 1);
-    EXPECT_EQ(log->count(Check("NCFASSERT( PF_UNDEFINED != pixelFormat )", "ProvideSampleRange")),
-              1);
-    EXPECT_EQ(log->count(Check("NCFASSERT( CT_UNDEFINED != componentType )", "ProvideSampleRange")),
-              1);
+    EXPECT_TRUE(log->once(Check("NCFASSERT( PF_UNDEFINED != pixelFormat )", "ProvideSampleRange")));
+    EXPECT_TRUE(
+        log->once(Check("NCFASSERT( CT_UNDEFINED != componentType )", "ProvideSampleRange")));
     EXPECT_FALSE(buffer->complete);
 }
 
@@ -315,7 +313,7 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfAPicture) {
     for (const auto& call : clipCalls) {
         clip->results = {{call.first, NCF_E_ABORT}};
         EXPECT_EQ(Ask(0), NCF_E_ABORT);
-        EXPECT_EQ(log->count(Record("80000007", call.second, "ProvideSampleRange")), 1);
+        EXPECT_TRUE(log->once(Record("80000007", call.second, "ProvideSampleRange")));
     }
     clip->results.clear();
     const std::pair<const char*, const char*> bufferCalls[] = {
@@ -326,7 +324,7 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfAPicture) {
     for (const auto& call : bufferCalls) {
         buffer->results = {{call.first, NCF_E_OUTOFMEMORY}};
         EXPECT_EQ(Ask(0), NCF_E_OUTOFMEMORY);
-        EXPECT_EQ(log->count(Record("80000002", call.second, "ProvideSampleRange")), 1);
+        EXPECT_TRUE(log->once(Record("80000002", call.second, "ProvideSampleRange")));
     }
     buffer->results.clear();
     buffer->givesNull = true;
@@ -334,14 +332,13 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfAPicture) {
     buffer->givesNull = false;
     mapping->mediaTracks_[0]->SetSelectedIndex(8);
     EXPECT_EQ(Ask(0), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003",
-                                "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
-                                "ProvideSampleRange")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000003",
+                                 "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
+                                 "ProvideSampleRange")));
     mapping->mediaTracks_[0]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
     mapping->mediaTracks_[0]->SetSelectedIndex(1);
     EXPECT_EQ(Ask(0), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(video_format)", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(video_format)", "ProvideSampleRange")));
 }
 
 TEST_F(Delivery, ReaderMayRefuseThePixelFormat) {
@@ -407,7 +404,7 @@ TEST_F(Delivery, NoSamplesFailBeforeTheBuffer) {
     Movie({kBGRAPixelFormat});
     ChooseSound(1);
     EXPECT_EQ(Ask(1, 0, 0), NCF_E_FAIL);
-    EXPECT_EQ(log->count(Check("NCFASSERT( memNeeded )", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(log->once(Check("NCFASSERT( memNeeded )", "ProvideSampleRange")));
     EXPECT_TRUE(journal.startingWith("buffer.").empty());
 }
 
@@ -425,9 +422,8 @@ TEST_F(Delivery, SoundSizeIsWorkedOutIn64Bits) {
     buffer->results["Allocate"] = NCF_E_OUTOFMEMORY;
     EXPECT_EQ(Ask(1, 0, ncfUInt64{1} << 32), NCF_E_OUTOFMEMORY);
     EXPECT_EQ(journal.count("buffer.Allocate 25769803776 1"), 1);
-    EXPECT_EQ(
-        log->count(Record("80000002", "pBuffer->Allocate(memToAlloc, 1)", "ProvideSampleRange")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000002", "pBuffer->Allocate(memToAlloc, 1)", "ProvideSampleRange")));
 }
 
 TEST_F(Delivery, GivesTheFailureOfEachStepOfSound) {
@@ -442,7 +438,7 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfSound) {
     for (const auto& call : bufferCalls) {
         buffer->results = {{call.first, NCF_E_ABORT}};
         EXPECT_EQ(Ask(1), NCF_E_ABORT);
-        EXPECT_EQ(log->count(Record("80000007", call.second, "ProvideSampleRange")), 1);
+        EXPECT_TRUE(log->once(Record("80000007", call.second, "ProvideSampleRange")));
     }
     buffer->results.clear();
     buffer->givesNull = true;
@@ -452,23 +448,21 @@ TEST_F(Delivery, GivesTheFailureOfEachStepOfSound) {
     journal.clear();
     EXPECT_EQ(Ask(1), NCF_E_FAIL);
     EXPECT_EQ(journal.count("buffer.GetBufferPointer"), 1) << "the buffer comes before the map";
-    EXPECT_EQ(log->count(Record("80000008", "AAFTrackToQuickTimeTrack(trackNMA, &trackQT)",
-                                "ProvideSampleRange")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000008", "AAFTrackToQuickTimeTrack(trackNMA, &trackQT)", "ProvideSampleRange")));
     MediaTrack& track = *mapping->mediaTracks_[1];
     track.SetSelectedIndex(2);
     EXPECT_EQ(Ask(1), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003",
-                                "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
-                                "ProvideSampleRange")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000003",
+                                 "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
+                                 "ProvideSampleRange")));
     track.AddFormat(QTAudioFormat(SF_PCM_INT_LE, 0, 24));
     EXPECT_EQ(Ask(1), NCF_E_FAIL);
-    EXPECT_EQ(log->count(Check("NCFASSERT( bytesPerSample )", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(log->once(Check("NCFASSERT( bytesPerSample )", "ProvideSampleRange")));
     track.AddFormat(QTImageFormat());
     track.SetSelectedIndex(3);
     EXPECT_EQ(Ask(1), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(audio_format)", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(audio_format)", "ProvideSampleRange")));
 }
 
 TEST_F(Delivery, SoundNeedsATrackThatKeepsAChannelCount) {
@@ -476,9 +470,9 @@ TEST_F(Delivery, SoundNeedsATrackThatKeepsAChannelCount) {
     mapping->mediaTracks_[1].reset(new SoundTrackWithoutChannels);
     mapping->mediaTracks_[1]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
     EXPECT_EQ(Ask(1), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(audio_track)", "ProvideSampleRange")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(audio_track)", "ProvideSampleRange")));
     EXPECT_EQ(mapping->SetWorkingAudioFormat(1, 0), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(audio_track)", "SetWorkingAudioFormat")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(audio_track)", "SetWorkingAudioFormat")));
 }
 
 TEST_F(Delivery, SoundBeforeTheAudioQueryIsNotInitialized) {

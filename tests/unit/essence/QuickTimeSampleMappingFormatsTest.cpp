@@ -188,10 +188,9 @@ TEST_F(SampleMappingFormats, AlphaGoesToAnAlphaTrackOnlyAndThePictureStays) {
         log->clear();
         EXPECT_EQ(mapping->AddPixelFormat(mapping->mediaTracks_[0].get(), &wrong, code, 0),
                   NCF_E_FAIL);
-        EXPECT_EQ(
-            log->count(Check("NCFASSERT( MediaTrack::kVideoAlpha == alpha_track->GetTrackType() )",
-                             "AddPixelFormat")),
-            1);
+        EXPECT_TRUE(
+            log->once(Check("NCFASSERT( MediaTrack::kVideoAlpha == alpha_track->GetTrackType() )",
+                            "AddPixelFormat")));
     }
     EXPECT_EQ(Offered(0).size(), 3u);
     EXPECT_EQ(wrong.GetNumberOfFormats(), 0u);
@@ -203,9 +202,9 @@ TEST_F(SampleMappingFormats, AlphaGoesToAnAlphaTrackOnlyAndThePictureStays) {
 TEST_F(SampleMappingFormats, PictureTrackIsNeeded) {
     Movie();
     EXPECT_EQ(mapping->AddPixelFormat(nullptr, nullptr, kBGRAPixelFormat, 0), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(video_track)", "AddPixelFormat")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(video_track)", "AddPixelFormat")));
     EXPECT_EQ(mapping->AddDecompressorPixelFormats(nullptr, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(video_track)", "AddDecompressorPixelFormats")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(video_track)", "AddDecompressorPixelFormats")));
 }
 
 TEST_F(SampleMappingFormats, ConsoleIsNeeded) {
@@ -213,7 +212,7 @@ TEST_F(SampleMappingFormats, ConsoleIsNeeded) {
     mapping->_pConsole = nullptr;
     EXPECT_EQ(mapping->AddDecompressorPixelFormats(mapping->mediaTracks_[0].get(), nullptr),
               NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(_pConsole)", "AddDecompressorPixelFormats")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(_pConsole)", "AddDecompressorPixelFormats")));
 }
 
 TEST_F(SampleMappingFormats, FormatKeepsTheClipsFieldsAsOfItsMaking) {
@@ -241,7 +240,7 @@ TEST_F(SampleMappingFormats, GivesTheClipsFailureWithTheTextOfItsRow) {
     for (const auto& call : calls) {
         clip->results = {{call.first, NCF_E_ABORT}};
         EXPECT_EQ(Add(kBGRAPixelFormat, 1), NCF_E_ABORT);
-        EXPECT_EQ(log->count(Record("80000007", call.second, "AddImagePixelFormat")), 1);
+        EXPECT_TRUE(log->once(Record("80000007", call.second, "AddImagePixelFormat")));
     }
     EXPECT_EQ(log->count(Record("80000007",
                                 "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, "
@@ -249,11 +248,10 @@ TEST_F(SampleMappingFormats, GivesTheClipsFailureWithTheTextOfItsRow) {
                                 "AddPixelFormat")),
               3);
     EXPECT_EQ(Add(kBGRAPixelFormat, 0), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007",
-                                "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, "
-                                "CT_UCHAR, CRT_FullRange, qt_params)",
-                                "AddPixelFormat")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000007",
+                                 "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, "
+                                 "CT_UCHAR, CRT_FullRange, qt_params)",
+                                 "AddPixelFormat")));
     EXPECT_EQ(Add(kb64aPixelFormat), NCF_E_ABORT);
     EXPECT_EQ(Add(kr4flPixelFormat), NCF_E_ABORT);
     EXPECT_EQ(log->count(Record("80000007",
@@ -264,17 +262,15 @@ TEST_F(SampleMappingFormats, GivesTheClipsFailureWithTheTextOfItsRow) {
     EXPECT_TRUE(host->console().lines().empty()) << "no line for what was not added";
     clip->setAlpha(false);
     EXPECT_EQ(Add(k2vuyPixelFormat), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007",
-                                "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, "
-                                "colorSpaceToUse, CT_UCHAR, CRT_VideoRange, qt_params)",
-                                "AddPixelFormat")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000007",
+                                 "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, "
+                                 "colorSpaceToUse, CT_UCHAR, CRT_VideoRange, qt_params)",
+                                 "AddPixelFormat")));
     EXPECT_EQ(Add(kv210PixelFormat), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007",
-                                "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, "
-                                "colorSpaceToUse, CT_V210, CRT_VideoRange, qt_params)",
-                                "AddPixelFormat")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000007",
+                                 "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, "
+                                 "colorSpaceToUse, CT_V210, CRT_VideoRange, qt_params)",
+                                 "AddPixelFormat")));
 }
 
 TEST_F(SampleMappingFormats, FailureAtTheAlphaStepLeavesThePictureFormat) {
@@ -293,12 +289,11 @@ TEST_F(SampleMappingFormats, FailureAtTheAlphaStepLeavesThePictureFormat) {
         host->console().clear();
         clip->spared["GetBufferLineOrientation"] = 1;
         EXPECT_EQ(Add(row.code), NCF_E_ABORT);
-        EXPECT_EQ(log->count(Record("80000007",
-                                    std::string("AddImagePixelFormat(alpha_track, PF_Mono, "
-                                                "CSS_None, CS_MONO, ") +
-                                        row.type + ", CRT_UNDEFINED, qt_params)",
-                                    "AddPixelFormat")),
-                  1)
+        EXPECT_TRUE(log->once(Record("80000007",
+                                     std::string("AddImagePixelFormat(alpha_track, PF_Mono, "
+                                                 "CSS_None, CS_MONO, ") +
+                                         row.type + ", CRT_UNDEFINED, qt_params)",
+                                     "AddPixelFormat")))
             << CodeText(row.code);
         EXPECT_EQ(ConsoleTexts(), Lines{std::string("4: ") + row.line});
     }
@@ -340,22 +335,20 @@ TEST_F(SampleMappingFormats, ColourSpaceGoesBySizeWhereTheClipHasNone) {
 TEST_F(SampleMappingFormats, ColourSpaceNeedsAnOutputAndASize) {
     Movie();
     EXPECT_EQ(InferColorSpaceFromStandard(clip, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count("CHK_INARG(colorSpace)InferColorSpaceFromStandard"), 1);
+    EXPECT_TRUE(log->once("CHK_INARG(colorSpace)InferColorSpaceFromStandard"));
     clip->setColorSpace(CS_UNDEFINED);
     clip->results["GetEncodedWidthAndHeight"] = NCF_E_HANDLE;
     EXPECT_EQ(Add(k2vuyPixelFormat), NCF_E_HANDLE);
-    EXPECT_EQ(log->count(Record("80000006", "InferColorSpaceFromStandard(media_, &colorSpaceToUse)",
-                                "AddPixelFormat")),
-              1);
+    EXPECT_TRUE(log->once(Record(
+        "80000006", "InferColorSpaceFromStandard(media_, &colorSpaceToUse)", "AddPixelFormat")));
 }
 
 TEST_F(SampleMappingFormats, OtherFailureOfTheColourSpaceIsAFailure) {
     Movie();
     clip->results["GetColorSpace"] = NCF_E_ABORT;
     EXPECT_EQ(Add(k2vuyPixelFormat), NCF_E_ABORT);
-    EXPECT_EQ(
-        log->count(Record("80000007", "media_->GetColorSpace(&colorSpaceToUse)", "AddPixelFormat")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000007", "media_->GetColorSpace(&colorSpaceToUse)", "AddPixelFormat")));
 }
 
 // --- from the codec's list ------------------------------------------------------------------
@@ -388,7 +381,7 @@ TEST_F(SampleMappingFormats, LastResortFailsOnAClipWithAlpha) {
         "_codecSupportsRGB_CCIR)";
     property->codes = {kv210PixelFormat, k2vuyPixelFormat, 5};
     EXPECT_EQ(QueryImages(), NCF_E_FAIL) << "no code of the list makes a format";
-    EXPECT_EQ(log->count(Record("80000008", record, "AddDecompressorPixelFormats")), 1);
+    EXPECT_TRUE(log->once(Record("80000008", record, "AddDecompressorPixelFormats")));
     property->codes = {kBGRAPixelFormat};
     clip->multiFormat = 1;
     EXPECT_EQ(QueryImages(), NCF_E_FAIL) << "no codec's own formats for several";
@@ -433,11 +426,10 @@ TEST_F(SampleMappingFormats, CodecWithoutFormatsGivesNothingToAClipWithAlpha) {
     EXPECT_EQ(Console(2, "No one image pixel format was added for alpha track.\n"), 1);
     EXPECT_TRUE(log->contains("No one image pixel format was added for video track."));
     EXPECT_TRUE(log->contains("No one image pixel format was added for alpha track."));
-    EXPECT_EQ(log->count(Record("80000008",
-                                "AddPixelFormat(video_track, alpha_track, "
-                                "QuickTime::k2vuyPixelFormat, _codecSupportsRGB_CCIR)",
-                                "AddDecompressorPixelFormats")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000008",
+                                 "AddPixelFormat(video_track, alpha_track, "
+                                 "QuickTime::k2vuyPixelFormat, _codecSupportsRGB_CCIR)",
+                                 "AddDecompressorPixelFormats")));
 }
 
 TEST_F(SampleMappingFormats, YCbCrCodecGivesItsPreferredFormatsOnly) {
@@ -511,9 +503,8 @@ TEST_F(SampleMappingFormats, GivesTheFailureOfTheQuestionForSeveralFormats) {
     clip->results["IsMultiFormatMovie"] = NCF_E_ABORT;
     property->codes = {kBGRAPixelFormat};
     EXPECT_EQ(QueryImages(), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007", "media_->IsMultiFormatMovie(&isMultiformat)",
-                                "AddDecompressorPixelFormats")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000007", "media_->IsMultiFormatMovie(&isMultiformat)",
+                                 "AddDecompressorPixelFormats")));
 }
 
 TEST_F(SampleMappingFormats, CopiesTheLevelWhenItLooksForFormats) {
@@ -549,17 +540,16 @@ TEST_F(SampleMappingFormats, GivesTheFailureOfEachQuestion) {
     for (const auto& call : calls) {
         property->results = {{call.first, NCF_E_ABORT}};
         EXPECT_EQ(QueryImages(), NCF_E_ABORT);
-        EXPECT_EQ(
-            log->count(Record("80000007", call.second, "AddSupportedImageFormatsBasedOnCodec")), 1);
+        EXPECT_TRUE(
+            log->once(Record("80000007", call.second, "AddSupportedImageFormatsBasedOnCodec")));
     }
     property->results.clear();
     property->codes = {kBGRAPixelFormat};
     property->bufferResult = NCF_E_HANDLE;
     EXPECT_EQ(QueryImages(), NCF_E_HANDLE);
-    EXPECT_EQ(
-        log->count(Record("80000006", "pixBuffer->GetBufferPointer((void**)&codecPixelFormats_ptr)",
-                          "AddSupportedImageFormatsBasedOnCodec")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000006", "pixBuffer->GetBufferPointer((void**)&codecPixelFormats_ptr)",
+                         "AddSupportedImageFormatsBasedOnCodec")));
     EXPECT_EQ(Offered(0), kNothing);
 }
 
@@ -567,10 +557,9 @@ TEST_F(SampleMappingFormats, NeedsThePropertyComponent) {
     Movie();
     host->refuseCreation(QuickTime::CompID_QuickTimeProperty, NCF_E_OUTOFMEMORY);
     EXPECT_EQ(QueryImages(), NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(
-        log->count(Record("80000002", "media_->GetQuickTimePropertyComponent(quickTimeProperty)",
-                          "AddSupportedImageFormatsBasedOnCodec")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000002", "media_->GetQuickTimePropertyComponent(quickTimeProperty)",
+                         "AddSupportedImageFormatsBasedOnCodec")));
 }
 
 TEST_F(SampleMappingFormats, CodecThatCannotTellItsFormatsHasNone) {
@@ -595,7 +584,7 @@ TEST_F(SampleMappingFormats, ClipWithoutAPictureHasNoFormats) {
     AddAudio(1);
     Bind();
     EXPECT_EQ(QueryImages(), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(video_track)", "AddSupportedImageFormatsBasedOnCodec")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(video_track)", "AddSupportedImageFormatsBasedOnCodec")));
     EXPECT_EQ(journal.count("property.CreateMovie"), 0);
 }
 

@@ -57,9 +57,9 @@ TEST_F(ImageFormats, CountNeedsAnOutputThenAPictureTrack) {
     Movie({kBGRAPixelFormat});
     ncfUInt32 count = 77;
     EXPECT_EQ(mapping->GetNumberOfImageFormats(9, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(numFormats)", "GetNumberOfImageFormats")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(numFormats)", "GetNumberOfImageFormats")));
     EXPECT_EQ(mapping->GetNumberOfImageFormats(9, &count), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003", badTrack, "GetNumberOfImageFormats")), 1);
+    EXPECT_TRUE(log->once(Record("80000003", badTrack, "GetNumberOfImageFormats")));
     log->clear();
     EXPECT_EQ(mapping->GetNumberOfImageFormats(1, &count), NCF_E_INVALIDARG);
     EXPECT_TRUE(log->records().empty()) << "sound is refused silently";
@@ -80,7 +80,7 @@ TEST_F(ImageFormats, TellsAFormatUnderTheLock) {
 TEST_F(ImageFormats, BadTrackOutranksANullOutput) {
     Movie({kBGRAPixelFormat});
     EXPECT_EQ(Get(9, 0, 0), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003", badTrack, "GetImageFormat")), 1);
+    EXPECT_TRUE(log->once(Record("80000003", badTrack, "GetImageFormat")));
     EXPECT_FALSE(log->contains("CHK_INARG"));
 }
 
@@ -91,8 +91,7 @@ TEST_F(ImageFormats, EachOutputIsNeeded) {
                                  "frameLayout",        "orientation"};
     for (int i = 0; i < 8; ++i) {
         EXPECT_EQ(Get(0, 0, i), NCF_E_INVALIDARG);
-        EXPECT_EQ(log->count(Check(std::string("CHK_INARG(") + names[i] + ")", "GetImageFormat")),
-                  1);
+        EXPECT_TRUE(log->once(Check(std::string("CHK_INARG(") + names[i] + ")", "GetImageFormat")));
     }
     EXPECT_TRUE(journal.lines().empty()) << "before the lock";
 }
@@ -100,13 +99,13 @@ TEST_F(ImageFormats, EachOutputIsNeeded) {
 TEST_F(ImageFormats, FormatPastTheEndOrOfAnotherKindIsRefused) {
     Movie({kBGRAPixelFormat});
     EXPECT_EQ(Get(0, 1), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003", badFormat, "GetImageFormat")), 1);
+    EXPECT_TRUE(log->once(Record("80000003", badFormat, "GetImageFormat")));
     EXPECT_EQ(Get(1, 0), NCF_E_INVALIDARG) << "a sound track";
     mapping->mediaTracks_[0]->AddFormat(QTAudioFormat(SF_PCM_INT_LE, 3, 24));
     EXPECT_EQ(Get(0, 1), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(image_format)", "GetImageFormat")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(image_format)", "GetImageFormat")));
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(image_format)", "SetWorkingImageFormat")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(image_format)", "SetWorkingImageFormat")));
 }
 
 // --- the choice --------------------------------------------------------------------------
@@ -209,7 +208,7 @@ TEST_F(ImageFormats, ChoicePastTheEndLeavesSelectionAndReader) {
     EXPECT_EQ(journal.lines(), (Lines{"lock", "unlock"}));
     EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedIndex(), 1u);
     EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedFormat(), selected);
-    EXPECT_EQ(log->count(Record("80000003", badFormat, "SetWorkingImageFormat")), 1);
+    EXPECT_TRUE(log->once(Record("80000003", badFormat, "SetWorkingImageFormat")));
 }
 
 TEST_F(ImageFormats, ChoiceOfATrackOfTheWrongKindIsRefusedBeforeTheLock) {
@@ -217,7 +216,7 @@ TEST_F(ImageFormats, ChoiceOfATrackOfTheWrongKindIsRefusedBeforeTheLock) {
     EXPECT_EQ(mapping->SetWorkingImageFormat(1, 0), NCF_E_INVALIDARG);
     EXPECT_TRUE(log->records().empty());
     EXPECT_EQ(mapping->SetWorkingImageFormat(9, 0), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003", badTrack, "SetWorkingImageFormat")), 1);
+    EXPECT_TRUE(log->once(Record("80000003", badTrack, "SetWorkingImageFormat")));
     EXPECT_TRUE(journal.lines().empty());
 }
 
@@ -227,10 +226,9 @@ TEST_F(ImageFormats, FailureToStartLeavesTheSelectionChangedAndSaysSo) {
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_E_HANDLE);
     EXPECT_EQ(mapping->mediaTracks_[0]->GetSelectedIndex(), 1u);
     EXPECT_TRUE(mapping->mediaTracks_[0]->GetSelectedFormat());
-    EXPECT_EQ(log->count(Record("80000006",
-                                "_videoReaderHolder->InitQT( QTWrapper::kUseDecompressionSession)",
-                                "SetWorkingImageFormat")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000006",
+                                 "_videoReaderHolder->InitQT( QTWrapper::kUseDecompressionSession)",
+                                 "SetWorkingImageFormat")));
     wrapper->picture->results.clear();
     journal.clear();
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_OK) << "chosen already";
@@ -249,15 +247,13 @@ TEST_F(ImageFormats, ChoiceNeedsWrapperAndReader) {
     Movie({kBGRAPixelFormat, kb64aPixelFormat});
     host->refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_OUTOFMEMORY);
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 0), NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(log->count(Record("80000002", "media_->GetQuickTimeInterface(qtWrapper)",
-                                "SetWorkingImageFormat")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000002", "media_->GetQuickTimeInterface(qtWrapper)", "SetWorkingImageFormat")));
     host->clearRefusals();
     wrapper->results["GetQTVideoReader"] = NCF_E_NOTFOUND;
     EXPECT_EQ(mapping->SetWorkingImageFormat(0, 1), NCF_E_NOTFOUND);
-    EXPECT_EQ(log->count(Record("8000000c", "media_->GetQuickTimeVideoReader(_videoReaderHolder)",
-                                "SetWorkingImageFormat")),
-              1);
+    EXPECT_TRUE(log->once(Record("8000000c", "media_->GetQuickTimeVideoReader(_videoReaderHolder)",
+                                 "SetWorkingImageFormat")));
 }
 
 // --- sizes -----------------------------------------------------------------------------------
@@ -306,19 +302,18 @@ TEST_F(ImageFormats, SizeNeedsItsOutputsAndTheClip) {
     ncfUInt32 width = 77;
     ncfUInt32 height = 77;
     EXPECT_EQ(mapping->GetWorkingImageSize(0, nullptr, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(width)", "GetWorkingImageSize")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(width)", "GetWorkingImageSize")));
     EXPECT_EQ(mapping->GetWorkingImageSize(0, &width, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(height)", "GetWorkingImageSize")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(height)", "GetWorkingImageSize")));
     clip->results = {{"GetTemporalFieldOrder", NCF_E_ABORT}};
     EXPECT_EQ(mapping->GetWorkingImageSize(0, &width, &height), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007", "media_->GetTemporalFieldOrder(&temporalFieldOrder)",
-                                "GetWorkingImageSize")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000007", "media_->GetTemporalFieldOrder(&temporalFieldOrder)",
+                                 "GetWorkingImageSize")));
     clip->results = {{"GetEncodedWidthAndHeight", NCF_E_HANDLE}};
     EXPECT_EQ(mapping->GetWorkingImageSize(0, &width, &height), NCF_E_HANDLE);
-    EXPECT_EQ(log->count(Record("80000006", "media_->GetEncodedWidthAndHeight(width, &movieHeight)",
-                                "GetWorkingImageSize")),
-              1);
+    EXPECT_TRUE(
+        log->once(Record("80000006", "media_->GetEncodedWidthAndHeight(width, &movieHeight)",
+                         "GetWorkingImageSize")));
     mapping->media_.reset();
     EXPECT_EQ(mapping->GetWorkingImageSize(0, &width, &height), NMA_E_NOTINITIALIZED);
 }
@@ -374,25 +369,22 @@ TEST_F(ImageFormats, AlignmentIsWrittenEvenWhenTheRequirementsFail) {
     ncfUInt16 alignment = 77;
     ncfUInt64 size = 77;
     EXPECT_EQ(mapping->GetWorkingImageBufferRequirements(0, nullptr, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(
-        log->count(Check("CHK_INARG(bufferStartAlignment)", "GetWorkingImageBufferRequirements")),
-        1);
+    EXPECT_TRUE(
+        log->once(Check("CHK_INARG(bufferStartAlignment)", "GetWorkingImageBufferRequirements")));
     EXPECT_EQ(mapping->GetWorkingImageBufferRequirements(0, &alignment, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(maxBufferSize)", "GetWorkingImageBufferRequirements")),
-              1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(maxBufferSize)", "GetWorkingImageBufferRequirements")));
     EXPECT_EQ(alignment, 77);
     EXPECT_EQ(mapping->GetWorkingImageBufferRequirements(9, &alignment, &size), NCF_E_INVALIDARG);
     EXPECT_EQ(alignment, 1);
-    EXPECT_EQ(log->count(Record("80000003", badTrack, "GetWorkingImageBufferRequirements")), 1);
+    EXPECT_TRUE(log->once(Record("80000003", badTrack, "GetWorkingImageBufferRequirements")));
     alignment = 77;
     EXPECT_EQ(mapping->GetWorkingImageBufferRequirements(1, &alignment, &size), NCF_E_INVALIDARG)
         << "a sound track";
     EXPECT_EQ(alignment, 1);
     clip->results["GetEncodedWidthAndHeight"] = NCF_E_ABORT;
     EXPECT_EQ(mapping->GetWorkingImageBufferRequirements(0, &alignment, &size), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007", "media_->GetEncodedWidthAndHeight(&width, &height)",
-                                "GetWorkingImageBufferRequirements")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000007", "media_->GetEncodedWidthAndHeight(&width, &height)",
+                                 "GetWorkingImageBufferRequirements")));
     EXPECT_EQ(size, 77u);
 }
 
@@ -402,10 +394,9 @@ TEST_F(ImageFormats, TrackWithoutFormatsHasNoBuffer) {
     ncfUInt16 alignment = 77;
     ncfUInt64 size = 77;
     EXPECT_EQ(mapping->GetWorkingImageBufferRequirements(0, &alignment, &size), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Record("80000003",
-                                "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
-                                "GetWorkingImageBufferRequirements")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000003",
+                                 "track->GetMediaFormat(track->GetSelectedIndex(), mediaFormat)",
+                                 "GetWorkingImageBufferRequirements")));
 }
 
 }  // namespace

@@ -28,9 +28,8 @@ TEST_F(SampleQueries, TrackCountIsTheAnswerAndAFailureIsNegative) {
     EXPECT_EQ(interface->GetNumberOfTracks(), 5);
     clip->results["GetTrackCount"] = NMA_E_NODATA;
     EXPECT_EQ(interface->GetNumberOfTracks(), NMA_E_NODATA);
-    EXPECT_EQ(
-        log->count(Record("a000006f", "media_->GetTrackCount(&trackCount)", "GetNumberOfTracks")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("a000006f", "media_->GetTrackCount(&trackCount)", "GetNumberOfTracks")));
 }
 
 TEST_F(SampleQueries, TrackCountWithoutAClipIsNotInitialized) {
@@ -55,30 +54,29 @@ TEST_F(SampleQueries, SoundHasTheChannelsThatTheWrapperTells) {
 
 TEST_F(SampleQueries, ChannelsAreOneFromTheStart) {
     EXPECT_EQ(interface->GetNumberOfChannels(0, nullptr), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(numChannels)", "GetNumberOfChannels")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(numChannels)", "GetNumberOfChannels")));
     ncfUInt32 channels = 9;
     EXPECT_EQ(interface->GetNumberOfChannels(2, &channels), NCF_E_INVALIDARG);
     EXPECT_EQ(channels, 1u);
-    EXPECT_EQ(
-        log->count(Record("80000003", "GetMediaTrack(trackNMA, track)", "GetNumberOfChannels")), 1);
+    EXPECT_TRUE(
+        log->once(Record("80000003", "GetMediaTrack(trackNMA, track)", "GetNumberOfChannels")));
     channels = 9;
     wrapper->results["GetAudioInfoForTrack"] = NCF_E_ABORT;
     EXPECT_EQ(interface->GetNumberOfChannels(1, &channels), NCF_E_ABORT);
     EXPECT_EQ(channels, 1u);
-    EXPECT_EQ(log->count(Record("80000007",
-                                "qtWrapper->GetAudioInfoForTrack(trackQT, numChannels, NULL, NULL, "
-                                "NULL, NULL, NULL, NULL, NULL, NULL)",
-                                "GetNumberOfChannels")),
-              1);
+    EXPECT_TRUE(
+        log->once(Record("80000007",
+                         "qtWrapper->GetAudioInfoForTrack(trackQT, numChannels, NULL, NULL, "
+                         "NULL, NULL, NULL, NULL, NULL, NULL)",
+                         "GetNumberOfChannels")));
 }
 
 TEST_F(SampleQueries, ChannelsNeedTheWrapper) {
     host->refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_OUTOFMEMORY);
     ncfUInt32 channels = 9;
     EXPECT_EQ(interface->GetNumberOfChannels(1, &channels), NCF_E_OUTOFMEMORY);
-    EXPECT_EQ(log->count(Record("80000002", "media_->GetQuickTimeInterface(qtWrapper)",
-                                "GetNumberOfChannels")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000002", "media_->GetQuickTimeInterface(qtWrapper)", "GetNumberOfChannels")));
 }
 
 // Behind a second picture the list of tracks has the sound one place later than
@@ -94,7 +92,7 @@ TEST_F(SampleQueries, ChannelsBehindASecondPictureFollowTheListAndNotTheMap) {
     channels = 9;
     EXPECT_EQ(interface->GetNumberOfChannels(2, &channels), NCF_E_FAIL);
     EXPECT_EQ(channels, 1u);
-    EXPECT_EQ(log->count(Record("80000008", unmapped, "GetNumberOfChannels")), 1);
+    EXPECT_TRUE(log->once(Record("80000008", unmapped, "GetNumberOfChannels")));
     EXPECT_EQ(journal.count("wrapper.GetAudioInfoForTrack"), 0);
 }
 
@@ -129,8 +127,8 @@ TEST_F(SampleQueries, EveryOutputIsNeeded) {
     };
     for (const Case& check : cases) {
         EXPECT_EQ(check.result, NCF_E_INVALIDARG) << check.operation;
-        EXPECT_EQ(
-            log->count(Check(std::string("CHK_INARG(") + check.argument + ")", check.operation)), 1)
+        EXPECT_TRUE(
+            log->once(Check(std::string("CHK_INARG(") + check.argument + ")", check.operation)))
             << check.operation << " " << check.argument;
     }
 }
@@ -155,8 +153,8 @@ TEST_F(SampleQueries, NoClipIsTheMapsFailure) {
     ncfUInt64 out = 77;
     EXPECT_EQ(interface->GetNumberOfSamples(1, &out), NCF_E_POINTER);
     EXPECT_EQ(out, 77u);
-    EXPECT_EQ(log->count(Check("CHK_PTR(media_)", "AAFTrackToQuickTimeTrack")), 1);
-    EXPECT_EQ(log->count(Record("80000005", unmapped, "GetNumberOfSamples")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(media_)", "AAFTrackToQuickTimeTrack")));
+    EXPECT_TRUE(log->once(Record("80000005", unmapped, "GetNumberOfSamples")));
 }
 
 TEST_F(SampleQueries, UnmappedTrackFailsInTheMap) {
@@ -176,7 +174,7 @@ TEST_F(SampleQueries, UnmappedTrackFailsInTheMap) {
     for (const char* operation :
          {"GetNumberOfSamples", "GetSampleSize", "GetSamplePosition", "GetSampleTemporalOffset",
           "GetSampleProperties", "GetNumberOfContiguousSamples", "GetNumberOfContiguousBytes"}) {
-        EXPECT_EQ(log->count(Record("80000008", unmapped, operation)), 1) << operation;
+        EXPECT_TRUE(log->once(Record("80000008", unmapped, operation))) << operation;
     }
 }
 
@@ -222,9 +220,8 @@ TEST_F(SampleQueries, SampleCountIsTheClips) {
     EXPECT_EQ(out, 10u);
     clip->results["GetNumSamples"] = NCF_E_ABORT;
     EXPECT_EQ(interface->GetNumberOfSamples(1, &out), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007", "media_->GetNumSamples(trackQT, numSamples)",
-                                "GetNumberOfSamples")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000007", "media_->GetNumSamples(trackQT, numSamples)", "GetNumberOfSamples")));
 }
 
 TEST_F(SampleQueries, SizeWritesTheLowHalfOfTheCallersVariable) {
@@ -261,15 +258,13 @@ TEST_F(SampleQueries, PositionIsWrittenOnSuccessOnly) {
     EXPECT_EQ(interface->GetSamplePosition(0, 2, &out), NCF_E_NOTFOUND);
     EXPECT_EQ(interface->GetSampleSize(0, 2, &out), NCF_E_HANDLE);
     EXPECT_EQ(out, 8000u);
-    EXPECT_EQ(log->count(Record("8000000c",
-                                "media_->GetDataOffset(trackQT, sample + 1, &tmpPositionInBytes)",
-                                "GetSamplePosition")),
-              1);
-    EXPECT_EQ(log->count(Record("80000006",
-                                "media_->GetDataSizePerSample(trackQT, (long)sample + 1, "
-                                "(ncfUInt32*)sizeInBytesPtr)",
-                                "GetSampleSize")),
-              1);
+    EXPECT_TRUE(log->once(Record("8000000c",
+                                 "media_->GetDataOffset(trackQT, sample + 1, &tmpPositionInBytes)",
+                                 "GetSamplePosition")));
+    EXPECT_TRUE(log->once(Record("80000006",
+                                 "media_->GetDataSizePerSample(trackQT, (long)sample + 1, "
+                                 "(ncfUInt32*)sizeInBytesPtr)",
+                                 "GetSampleSize")));
 }
 
 TEST_F(SampleQueries, PropertiesFollowTheKindOfSample) {
@@ -300,10 +295,9 @@ TEST_F(SampleQueries, UnknownKindOfSampleFailsSilentlyAndWritesNothing) {
     EXPECT_TRUE(log->records().empty());
     clip->results["GetSampleFlags"] = NCF_E_ABORT;
     EXPECT_EQ(interface->GetSampleProperties(0, 0, &flags, &dependencies), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007",
-                                "media_->GetSampleFlags(trackQT, (long)sample + 1, &sampleFlags)",
-                                "GetSampleProperties")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000007",
+                                 "media_->GetSampleFlags(trackQT, (long)sample + 1, &sampleFlags)",
+                                 "GetSampleProperties")));
 }
 
 // --- runs -----------------------------------------------------------------------------------
@@ -361,11 +355,11 @@ TEST_F(SampleQueries, FailedWalkGivesOneSampleAtTheStartAndNoneLater) {
     EXPECT_TRUE(log->records().empty()) << "this failure is not told";
     ncfUInt64 bytes = 77;
     EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 0, &bytes), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007",
-                                "media_->GetNextDiscontiguousDataAttributeChange(trackQT, sample + "
-                                "1, &lastSample)",
-                                "GetNumberOfContiguousBytes")),
-              1);
+    EXPECT_TRUE(
+        log->once(Record("80000007",
+                         "media_->GetNextDiscontiguousDataAttributeChange(trackQT, sample + "
+                         "1, &lastSample)",
+                         "GetNumberOfContiguousBytes")));
 }
 
 TEST_F(SampleQueries, FailedWalkThatToldAnEndIsStillOneSampleAndComparedWithIt) {
@@ -397,9 +391,8 @@ TEST_F(SampleQueries, RunNeedsTheKindOfTrack) {
     ncfSInt64 run = 77;
     EXPECT_EQ(interface->GetNumberOfContiguousSamples(1, 0, &run), NCF_E_NOTFOUND);
     EXPECT_EQ(run, 77);
-    EXPECT_EQ(log->count(Record("8000000c", "media_->GetTrackType(trackQT, &trackType)",
-                                "GetNumberOfContiguousSamples")),
-              1);
+    EXPECT_TRUE(log->once(Record("8000000c", "media_->GetTrackType(trackQT, &trackType)",
+                                 "GetNumberOfContiguousSamples")));
 }
 
 TEST_F(SampleQueries, BytesOfARunReachFromItsFirstToTheEndOfItsLastSample) {
@@ -450,22 +443,18 @@ TEST_F(SampleQueries, BytesGiveTheFailureOfEachCall) {
     EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 1, &bytes), NCF_E_ABORT);
     clip->results = {{"GetDataOffset 8 5", NCF_E_NOTFOUND}};
     EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 1, &bytes), NCF_E_NOTFOUND);
-    EXPECT_EQ(log->count(Record("8000000c",
-                                "media_->GetDataOffset(trackQT, lastSample - 1, &lastPosition)",
-                                "GetNumberOfContiguousBytes")),
-              1);
+    EXPECT_TRUE(log->once(Record("8000000c",
+                                 "media_->GetDataOffset(trackQT, lastSample - 1, &lastPosition)",
+                                 "GetNumberOfContiguousBytes")));
     clip->results = {{"GetDataSizePerSample", NCF_E_HANDLE}};
     EXPECT_EQ(interface->GetNumberOfContiguousBytes(1, 1, &bytes), NCF_E_HANDLE);
     EXPECT_EQ(bytes, 77u);
-    EXPECT_EQ(
-        log->count(Record("80000007", "media_->GetDataOffset(trackQT, sample + 1, &startPosition)",
-                          "GetNumberOfContiguousBytes")),
-        1);
-    EXPECT_EQ(
-        log->count(Record("80000006",
-                          "media_->GetDataSizePerSample(trackQT, (long)lastSample-1, &lastSize)",
-                          "GetNumberOfContiguousBytes")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000007", "media_->GetDataOffset(trackQT, sample + 1, &startPosition)",
+                         "GetNumberOfContiguousBytes")));
+    EXPECT_TRUE(log->once(
+        Record("80000006", "media_->GetDataSizePerSample(trackQT, (long)lastSample-1, &lastSize)",
+               "GetNumberOfContiguousBytes")));
 }
 
 // --- units ------------------------------------------------------------------------------------

@@ -93,10 +93,9 @@ TEST_F(TemporalOffset, IndexBeforeTheFirstSampleWrapsAndTheClipEndsTheSearch) {
     EXPECT_EQ(Probes(), (Lines{"2", "3", "-1"}))
         << "at distance 1 the way back sees zero and asks nothing";
     EXPECT_EQ(offset, 77);
-    EXPECT_EQ(log->count(Record("80000003",
-                                "media_->GetDisplayOffset(trackQT, sample + 1 - curPos, &qtOffset)",
-                                "GetSampleTemporalOffset")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000003", "media_->GetDisplayOffset(trackQT, sample + 1 - curPos, &qtOffset)",
+               "GetSampleTemporalOffset")));
 }
 
 TEST_F(TemporalOffset, BothWaysExhaustedFailSilently) {
@@ -160,7 +159,7 @@ TEST_F(TemporalOffset, GivesTheFailureOfEachCall) {
     for (const auto& call : calls) {
         clip->results = {{call.first, NCF_E_ABORT}};
         EXPECT_EQ(Ask(0), NCF_E_ABORT);
-        EXPECT_EQ(log->count(Record("80000007", call.second, "GetSampleTemporalOffset")), 1)
+        EXPECT_TRUE(log->once(Record("80000007", call.second, "GetSampleTemporalOffset")))
             << call.first;
     }
 }
@@ -170,10 +169,9 @@ TEST_F(TemporalOffset, FailureOfAProbeEndsTheSearch) {
     clip->results = {{"GetDisplayOffset 7 3", NCF_E_ABORT}};
     EXPECT_EQ(Ask(1), NCF_E_ABORT) << "the way forward";
     EXPECT_EQ(Probes(), Lines{"3"});
-    EXPECT_EQ(log->count(Record("80000007",
-                                "media_->GetDisplayOffset(trackQT, sample + 1 + curPos, &qtOffset)",
-                                "GetSampleTemporalOffset")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000007", "media_->GetDisplayOffset(trackQT, sample + 1 + curPos, &qtOffset)",
+               "GetSampleTemporalOffset")));
     journal.clear();
     clip->results = {{"GetDisplayOffset 7 1", NCF_E_HANDLE}};
     EXPECT_EQ(Ask(1), NCF_E_HANDLE) << "the way back";

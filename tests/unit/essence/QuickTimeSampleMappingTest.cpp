@@ -123,11 +123,10 @@ TEST_F(SampleMapping, GivesTheRefusalOfItsParameters) {
     host->refuseCreation(NMA::CompID_QTParameters, NCF_E_OUTOFMEMORY);
     EXPECT_EQ(mapping->QueryInterface(IID_INCFParametersXML, &out), NCF_E_OUTOFMEMORY);
     EXPECT_EQ(out, nullptr);
-    EXPECT_EQ(log->count(Record("80000002",
-                                "_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, "
-                                "IID_INCFParametersXML, ppvObj)",
-                                "InternalQueryInterface")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000002",
+                                 "_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, "
+                                 "IID_INCFParametersXML, ppvObj)",
+                                 "InternalQueryInterface")));
 }
 
 TEST_F(SampleMapping, CannotUseParametersThatAreNotTheModulesOwn) {
@@ -156,10 +155,9 @@ TEST_F(SampleMapping, ParametersQueryWithoutAClipLoadsItFirst) {
     ASSERT_EQ(mapping->SetFilePath(path), NCF_OK);
     EXPECT_EQ(Query(IID_INCFParametersXML), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(host->creations(NMA::CompID_QTParameters), 0);
-    EXPECT_EQ(
-        log->count(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
-                          "InternalQueryInterface")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
+                         "InternalQueryInterface")));
 }
 
 // --- the image query -----------------------------------------------------------------------
@@ -196,9 +194,8 @@ TEST_F(SampleMapping, FailedImageQueryGivesTheCodeAndAReferenceToRelease) {
     EXPECT_EQ(mapping->QueryInterface(NMA::IID_IUncompressedImageProvider, &out), NCF_E_HANDLE);
     ASSERT_EQ(out, static_cast<NMA::IUncompressedImageProvider*>(mapping));
     EXPECT_EQ(static_cast<INCFUnknown*>(out)->Release(), 1u) << "the fixture's is left";
-    EXPECT_EQ(log->count(Record("80000006", "AddSupportedImageFormatsBasedOnCodec()",
-                                "InternalQueryInterface")),
-              1);
+    EXPECT_TRUE(log->once(
+        Record("80000006", "AddSupportedImageFormatsBasedOnCodec()", "InternalQueryInterface")));
 }
 
 TEST_F(SampleMapping, ImageQueryWithoutAClipLoadsItAndKeepsTheOneThatFailed) {
@@ -207,10 +204,9 @@ TEST_F(SampleMapping, ImageQueryWithoutAClipLoadsItAndKeepsTheOneThatFailed) {
     ASSERT_EQ(mapping->SetFilePath(path), NCF_OK);
     EXPECT_EQ(QueryImages(), NMA_E_NOTINITIALIZED);
     EXPECT_TRUE(mapping->media_);
-    EXPECT_EQ(
-        log->count(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
-                          "InternalQueryInterface")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
+                         "InternalQueryInterface")));
     EXPECT_EQ(QueryImages(), NCF_E_POINTER) << "it has no tracks, and is not loaded again";
 }
 
@@ -283,9 +279,8 @@ TEST_F(SampleMapping, FailedAudioQueryGivesTheCodeAndAReferenceToRelease) {
     EXPECT_EQ(mapping->QueryInterface(NMA::IID_IUncompressedAudioProvider, &out), NCF_E_NOTFOUND);
     ASSERT_EQ(out, static_cast<NMA::IUncompressedAudioProvider*>(mapping));
     EXPECT_EQ(static_cast<INCFUnknown*>(out)->Release(), 1u);
-    EXPECT_EQ(log->count(Record("8000000c", "media_->GetQuickTimeAudioReader(_audioReaderHolder)",
-                                "InternalQueryInterface")),
-              1);
+    EXPECT_TRUE(log->once(Record("8000000c", "media_->GetQuickTimeAudioReader(_audioReaderHolder)",
+                                 "InternalQueryInterface")));
 }
 
 TEST_F(SampleMapping, CreationThatAsksForAProviderGivesItsFailureWithAReference) {
@@ -313,12 +308,12 @@ TEST_F(SampleMapping, GivesTheFailureToTurnThePath) {
     NCFSmartPtr<INCFString> path;
     path.attach(new StubbornString("/movies/a.mov", "ConvertTo", NCF_E_ABORT));
     EXPECT_EQ(mapping->SetFilePath(path), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000007", "_filePath->ConvertTo(kNCFUTF16)", "SetFilePath")), 1);
+    EXPECT_TRUE(log->once(Record("80000007", "_filePath->ConvertTo(kNCFUTF16)", "SetFilePath")));
 }
 
 TEST_F(SampleMapping, RefusesANullClip) {
     EXPECT_EQ(mapping->SetMediaContainer(std::tr1::shared_ptr<BaseClip>()), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(media)", "SetMediaContainer")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(media)", "SetMediaContainer")));
 }
 
 TEST_F(SampleMapping, TakesAClipThatCannotTellItsTracks) {
@@ -327,9 +322,8 @@ TEST_F(SampleMapping, TakesAClipThatCannotTellItsTracks) {
     clip->results["GetAudioTrackCount"] = NCF_E_FAIL;
     EXPECT_EQ(mapping->SetMediaContainer(clip), NCF_OK);
     EXPECT_EQ(mapping->mediaTracks_.size(), 1u) << "what it told up to there";
-    EXPECT_EQ(log->count(Record("80000008", "media->GetAudioTrackCount(&audioTrackCount)",
-                                "InitializeMediaTracks")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000008", "media->GetAudioTrackCount(&audioTrackCount)",
+                                 "InitializeMediaTracks")));
     clip->results["GetVideoTrackCount"] = NCF_E_HANDLE;
     EXPECT_EQ(mapping->SetMediaContainer(clip), NCF_OK);
     EXPECT_EQ(mapping->mediaTracks_.size(), 1u);
@@ -360,12 +354,10 @@ TEST_F(SampleMapping, GivesTheFailureOfStartingAndStopping) {
     wrapper->picture->results = {{"InitQT", NCF_E_HANDLE}, {"ReleaseQT", NCF_E_ABORT}};
     EXPECT_EQ(mapping->Setup(0), NCF_E_HANDLE);
     EXPECT_EQ(mapping->Cleanup(0), NCF_E_ABORT);
-    EXPECT_EQ(log->count(Record("80000006",
-                                "_videoReaderHolder->InitQT(QTWrapper::kUseDecompressionSession)",
-                                "SetupOrCleanup")),
-              1);
-    EXPECT_EQ(log->count(Record("80000007", "_videoReaderHolder->ReleaseQT()", "SetupOrCleanup")),
-              1);
+    EXPECT_TRUE(log->once(Record("80000006",
+                                 "_videoReaderHolder->InitQT(QTWrapper::kUseDecompressionSession)",
+                                 "SetupOrCleanup")));
+    EXPECT_TRUE(log->once(Record("80000007", "_videoReaderHolder->ReleaseQT()", "SetupOrCleanup")));
 }
 
 TEST_F(SampleMapping, StartsAndStopsForTheAlphaTrackToo) {
@@ -395,10 +387,9 @@ TEST_F(SampleMapping, StartingWithoutAClipLoadsItFirstAndStoppingNeedsNone) {
     EXPECT_EQ(host->creations(NCFCompID_QTParser), 0);
     EXPECT_EQ(mapping->Setup(0), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(journal.count("reader.InitQT"), 0);
-    EXPECT_EQ(
-        log->count(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
-                          "SetupOrCleanup")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("a0000068", "LoadMedia(_filePath, _pConsole, _pComponentFactory, media_)",
+                         "SetupOrCleanup")));
     EXPECT_EQ(mapping->Setup(0), NCF_OK) << "the clip that failed is kept";
 }
 
@@ -516,9 +507,8 @@ TEST_F(SampleMapping, RefreshGivesTheFailureOfTheFields) {
     Bind();
     clip->results["SetFieldLayoutDetails"] = NCF_E_ABORT;
     EXPECT_EQ(mapping->RefreshBasedOnUIParams(), NCF_E_ABORT);
-    EXPECT_EQ(
-        log->count(Record("80000007", "media_->SetFieldLayoutDetails()", "RefreshBasedOnUIParams")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000007", "media_->SetFieldLayoutDetails()", "RefreshBasedOnUIParams")));
 }
 
 TEST_F(SampleMapping, RefreshWithoutAClipIsNotInitialized) {

@@ -104,10 +104,10 @@ TEST_F(SampleMappingTracks, MapOfAClipWithoutTracksIsTriedAtEachCall) {
 
 TEST_F(SampleMappingTracks, TranslationNeedsAnOutputThenAClip) {
     EXPECT_EQ(mapping->AAFTrackToQuickTimeTrack(0, nullptr), NCF_E_INVALIDARG);
-    EXPECT_EQ(log->count(Check("CHK_INARG(trackQTOut)", "AAFTrackToQuickTimeTrack")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_INARG(trackQTOut)", "AAFTrackToQuickTimeTrack")));
     ncfUInt32 out = 0;
     EXPECT_EQ(mapping->AAFTrackToQuickTimeTrack(0, &out), NCF_E_POINTER);
-    EXPECT_EQ(log->count(Check("CHK_PTR(media_)", "AAFTrackToQuickTimeTrack")), 1);
+    EXPECT_TRUE(log->once(Check("CHK_PTR(media_)", "AAFTrackToQuickTimeTrack")));
 }
 
 TEST_F(SampleMappingTracks, LargestTrackNumberIsPastTheEndToo) {
@@ -145,18 +145,16 @@ TEST_F(SampleMappingTracks, FailureToMapIsTheClipsAndLeavesWhatWasFound) {
         log->clear();
         EXPECT_EQ(RemapAAFTracksToQuickTimeTracks(clip, map), NCF_E_ABORT);
         EXPECT_EQ(map.size(), left[i]);
-        EXPECT_EQ(log->count(std::string("NCF_RETURN(0x80000007): ") + calls[i].second +
-                             " : RemapAAFTracksToQuickTimeTracks"),
-                  1);
+        EXPECT_TRUE(log->once(std::string("NCF_RETURN(0x80000007): ") + calls[i].second +
+                              " : RemapAAFTracksToQuickTimeTracks"));
     }
     Bind();
     clip->results = {{"GetVideoTrackQTId", NCF_E_HANDLE}};
     ncfUInt32 out = 0;
     EXPECT_EQ(mapping->AAFTrackToQuickTimeTrack(0, &out), NCF_E_HANDLE);
-    EXPECT_EQ(
-        log->count(Record("80000006", "RemapAAFTracksToQuickTimeTracks(media_, _trackRemapVect)",
-                          "AAFTrackToQuickTimeTrack")),
-        1);
+    EXPECT_TRUE(
+        log->once(Record("80000006", "RemapAAFTracksToQuickTimeTracks(media_, _trackRemapVect)",
+                         "AAFTrackToQuickTimeTrack")));
 }
 
 TEST_F(SampleMappingTracks, TrackPastTheEndIsSilentlyInvalid) {
@@ -172,7 +170,7 @@ TEST_F(SampleMappingTracks, EmptySlotIsAsserted) {
     mapping->mediaTracks_.resize(1);
     std::tr1::shared_ptr<MediaTrack> track;
     EXPECT_EQ(mapping->GetMediaTrack(0, track), NCF_E_FAIL);
-    EXPECT_EQ(log->count(Check("NCFASSERT( mediaTrack.get() )", "GetMediaTrack")), 1);
+    EXPECT_TRUE(log->once(Check("NCFASSERT( mediaTrack.get() )", "GetMediaTrack")));
     EXPECT_EQ(mapping->FirstTrackOf(MediaTrack::kVideo), nullptr);
 }
 

@@ -124,8 +124,8 @@ TEST(MissingAtom, IsNamedByTheReason) {
     }
 }
 
-TEST(ParserLimits, EachTakesWhatComesUpToIt) {
-    using header_parser::ParserLimits;
+// Two of everything that has a limit.
+movies::Movie MovieOfTwo() {
     movies::Movie movie = PlainMovie();
     movie.tracks.push_back(movie.tracks.front());
     movie.leading = {movies::Box("free"), movies::Box("free")};
@@ -133,6 +133,13 @@ TEST(ParserLimits, EachTakesWhatComesUpToIt) {
     movies::VideoFormat format;
     format.rasterText.emplace(100, 'x');
     movie.tracks[0].descriptions = {format.ToBox(), format.ToBox()};
+    return movie;
+}
+
+using header_parser::ParserLimits;
+
+TEST(ParserLimits, EachTakesWhatComesUpToIt) {
+    const movies::Movie movie = MovieOfTwo();
     ParserLimits limits;
     limits.maxTracks = 2;
     limits.maxTopLevelAtoms = 5;  // ftyp, free, free, mdat, moov
@@ -146,42 +153,28 @@ TEST(ParserLimits, EachTakesWhatComesUpToIt) {
 }
 
 TEST(ParserLimits, EachRefusesAMovieThatTheDefaultTakes) {
-    using header_parser::ParserLimits;
-    movies::Movie movie = PlainMovie();
-    movie.tracks.push_back(movie.tracks.front());
-    movie.leading = {movies::Box("free"), movies::Box("free")};
-    movie.tracks[0].edits = {{300, 0, 1.0}, {300, 0, 1.0}};
-    movies::VideoFormat format;
-    format.rasterText.emplace(100, 'x');
-    movie.tracks[0].descriptions = {format.ToBox(), format.ToBox()};
-    ASSERT_EQ(ParsedMovie(movie).Result(), NCF_OK) << ParsedMovie(movie).Reason();
-
-    ParserLimits limits;
-    limits.maxTracks = 1;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
-    limits = {};
-    limits.maxTopLevelAtoms = 4;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
-    limits = {};
-    limits.maxHeaderBytes = 500;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
-    limits = {};
-    limits.maxEditsInTrack = 1;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
-    limits = {};
-    limits.maxDescriptionsInTrack = 1;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
-    limits = {};
-    limits.maxAttributeText = 99;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
-    movie.compressed = true;
-    ASSERT_EQ(ParsedMovie(movie).Result(), NCF_OK);
-    limits = {};
-    limits.maxInflatedBytes = 500;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
-    limits = {};
-    limits.maxInflationRatio = 1;
-    EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY);
+    const struct {
+        const char* name;
+        void (*narrow)(ParserLimits&);
+        bool compressed = false;
+    } rows[] = {
+        {"tracks", [](ParserLimits& limits) { limits.maxTracks = 1; }},
+        {"atoms", [](ParserLimits& limits) { limits.maxTopLevelAtoms = 4; }},
+        {"header bytes", [](ParserLimits& limits) { limits.maxHeaderBytes = 500; }},
+        {"edits", [](ParserLimits& limits) { limits.maxEditsInTrack = 1; }},
+        {"descriptions", [](ParserLimits& limits) { limits.maxDescriptionsInTrack = 1; }},
+        {"attribute text", [](ParserLimits& limits) { limits.maxAttributeText = 99; }},
+        {"inflated bytes", [](ParserLimits& limits) { limits.maxInflatedBytes = 500; }, true},
+        {"inflation", [](ParserLimits& limits) { limits.maxInflationRatio = 1; }, true},
+    };
+    movies::Movie movie = MovieOfTwo();
+    for (const auto& row : rows) {
+        movie.compressed = row.compressed;
+        EXPECT_EQ(ParsedMovie(movie).Result(), NCF_OK) << ParsedMovie(movie).Reason();
+        ParserLimits limits;
+        row.narrow(limits);
+        EXPECT_EQ(ParsedMovie(movie, limits).Result(), NCF_E_OUTOFMEMORY) << row.name;
+    }
 }
 
 }  // namespace

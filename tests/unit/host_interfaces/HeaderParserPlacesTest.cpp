@@ -1,229 +1,136 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// The places of the operations of host_interfaces/header_parser/ in their tables, written
-// down once more and called by number: modules that are built call by place.
+// The places of the operations of host_interfaces/header_parser/ in their tables.
 
 #include "host_interfaces/header_parser/QTParser.h"
 #include "host_interfaces/header_parser/SampleDescription.h"
 #include "host_interfaces/header_parser/SampleTable.h"
 #include "host_interfaces/header_parser/TrackInfo.h"
-#include "tests/unit/host_interfaces/CallPlace.h"
+#include "tests/support/Slots.h"
 
-// clang-format off
 namespace {
 
-struct PlacesIQTParser : PlaceFake<IQTParser> {
-    NCFRESULT GetCreationTime(ncfUInt64*) override { return Ran<NCFRESULT>("GetCreationTime"); }
-    NCFRESULT ReservedParser4() override { return Ran<NCFRESULT>("ReservedParser4"); }
-    NCFRESULT GetTimeScale(ncfUInt32*) override { return Ran<NCFRESULT>("GetTimeScale"); }
-    NCFRESULT GetMovieDuration(ncfUInt32*) override { return Ran<NCFRESULT>("GetMovieDuration"); }
-    NCFRESULT ReservedParser7() override { return Ran<NCFRESULT>("ReservedParser7"); }
-    NCFRESULT ReservedParser8() override { return Ran<NCFRESULT>("ReservedParser8"); }
-    NCFRESULT ReservedParser9() override { return Ran<NCFRESULT>("ReservedParser9"); }
-    NCFRESULT GetVideoTrackCount(ncfUInt32*) override { return Ran<NCFRESULT>("GetVideoTrackCount"); }
-    NCFRESULT GetAudioTrackCount(ncfUInt32*) override { return Ran<NCFRESULT>("GetAudioTrackCount"); }
-    NCFRESULT GetTimeCodeTrackCount(ncfUInt32*) override { return Ran<NCFRESULT>("GetTimeCodeTrackCount"); }
-    NCFRESULT GetOtherTrackCount(ncfUInt32*) override { return Ran<NCFRESULT>("GetOtherTrackCount"); }
-    NCFRESULT GetVideoTrackInfo(ncfUInt32, IVideoTrackInfo**) override { return Ran<NCFRESULT>("GetVideoTrackInfo"); }
-    NCFRESULT GetAudioTrackInfo(ncfUInt32, IAudioTrackInfo**) override { return Ran<NCFRESULT>("GetAudioTrackInfo"); }
-    NCFRESULT GetTimeCodeTrackInfo(ncfUInt32, ITrackInfo**) override { return Ran<NCFRESULT>("GetTimeCodeTrackInfo"); }
-    NCFRESULT GetOtherTrackInfo(ncfUInt32, ITrackInfo**) override { return Ran<NCFRESULT>("GetOtherTrackInfo"); }
-    NCFRESULT ParseHeaders(const ncfUInt8*, const ncfUInt8*, ncfUInt64) override { return Ran<NCFRESULT>("ParseHeaders"); }
-    NCFRESULT GetRecomendedReadPosition(ncfUInt64*, ncfUInt32*) override { return Ran<NCFRESULT>("GetRecomendedReadPosition"); }
-    NCFRESULT GetTimeCodeInfo(ncfUInt8*, ncfUInt8*, ncfUInt8*, ncfUInt8*, ncfUInt32*, ncfUInt32*, ncfUInt32*, ncfUInt32*) override { return Ran<NCFRESULT>("GetTimeCodeInfo"); }
-    NCFRESULT IsMovieSelfContained(ncfBool*) override { return Ran<NCFRESULT>("IsMovieSelfContained"); }
-    NCFRESULT GetMOOVAtom(ncfUInt64*, ncfUInt64*) override { return Ran<NCFRESULT>("GetMOOVAtom"); }
+// clang-format off
+const SlotRow kSlots[] = {
+    {"IQTParser::GetCreationTime", 3, SlotOf(&IQTParser::GetCreationTime)},
+    {"IQTParser::ReservedParser4", 4, SlotOf(&IQTParser::ReservedParser4)},
+    {"IQTParser::GetTimeScale", 5, SlotOf(&IQTParser::GetTimeScale)},
+    {"IQTParser::GetMovieDuration", 6, SlotOf(&IQTParser::GetMovieDuration)},
+    {"IQTParser::ReservedParser7", 7, SlotOf(&IQTParser::ReservedParser7)},
+    {"IQTParser::ReservedParser8", 8, SlotOf(&IQTParser::ReservedParser8)},
+    {"IQTParser::ReservedParser9", 9, SlotOf(&IQTParser::ReservedParser9)},
+    {"IQTParser::GetVideoTrackCount", 10, SlotOf(&IQTParser::GetVideoTrackCount)},
+    {"IQTParser::GetAudioTrackCount", 11, SlotOf(&IQTParser::GetAudioTrackCount)},
+    {"IQTParser::GetTimeCodeTrackCount", 12, SlotOf(&IQTParser::GetTimeCodeTrackCount)},
+    {"IQTParser::GetOtherTrackCount", 13, SlotOf(&IQTParser::GetOtherTrackCount)},
+    {"IQTParser::GetVideoTrackInfo", 14, SlotOf(&IQTParser::GetVideoTrackInfo)},
+    {"IQTParser::GetAudioTrackInfo", 15, SlotOf(&IQTParser::GetAudioTrackInfo)},
+    {"IQTParser::GetTimeCodeTrackInfo", 16, SlotOf(&IQTParser::GetTimeCodeTrackInfo)},
+    {"IQTParser::GetOtherTrackInfo", 17, SlotOf(&IQTParser::GetOtherTrackInfo)},
+    {"IQTParser::ParseHeaders", 18, SlotOf(&IQTParser::ParseHeaders)},
+    {"IQTParser::GetRecomendedReadPosition", 19, SlotOf(&IQTParser::GetRecomendedReadPosition)},
+    {"IQTParser::GetTimeCodeInfo", 20, SlotOf(&IQTParser::GetTimeCodeInfo)},
+    {"IQTParser::IsMovieSelfContained", 21, SlotOf(&IQTParser::IsMovieSelfContained)},
+    {"IQTParser::GetMOOVAtom", 22, SlotOf(&IQTParser::GetMOOVAtom)},
+    {"IQTParserColor::ColorFlagA", 3, SlotOf(&IQTParserColor::ColorFlagA)},
+    {"IQTParserColor::ColorFlagB", 4, SlotOf(&IQTParserColor::ColorFlagB)},
+    {"IVideoSampleDescription::GetDataFormat", 3, SlotOf(&IVideoSampleDescription::GetDataFormat)},
+    {"IVideoSampleDescription::ReservedVideoDescription4", 4, SlotOf(&IVideoSampleDescription::ReservedVideoDescription4)},
+    {"IVideoSampleDescription::GetEncodedWidthAndHeight", 5, SlotOf(&IVideoSampleDescription::GetEncodedWidthAndHeight)},
+    {"IVideoSampleDescription::ReservedVideoDescription6", 6, SlotOf(&IVideoSampleDescription::ReservedVideoDescription6)},
+    {"IVideoSampleDescription::ReservedVideoDescription7", 7, SlotOf(&IVideoSampleDescription::ReservedVideoDescription7)},
+    {"IVideoSampleDescription::ReservedVideoDescription8", 8, SlotOf(&IVideoSampleDescription::ReservedVideoDescription8)},
+    {"IVideoSampleDescription::ReservedVideoDescription9", 9, SlotOf(&IVideoSampleDescription::ReservedVideoDescription9)},
+    {"IVideoSampleDescription::HasAlpha", 10, SlotOf(&IVideoSampleDescription::HasAlpha)},
+    {"IVideoSampleDescription::ReservedVideoDescription11", 11, SlotOf(&IVideoSampleDescription::ReservedVideoDescription11)},
+    {"IVideoSampleDescription::GetFieldInfo", 12, SlotOf(&IVideoSampleDescription::GetFieldInfo)},
+    {"IVideoSampleDescription::ReservedVideoDescription13", 13, SlotOf(&IVideoSampleDescription::ReservedVideoDescription13)},
+    {"IVideoSampleDescription::ReservedVideoDescription14", 14, SlotOf(&IVideoSampleDescription::ReservedVideoDescription14)},
+    {"IVideoSampleDescription::ReservedVideoDescription15", 15, SlotOf(&IVideoSampleDescription::ReservedVideoDescription15)},
+    {"IVideoSampleDescription::ReservedVideoDescription16", 16, SlotOf(&IVideoSampleDescription::ReservedVideoDescription16)},
+    {"IVideoSampleDescription::ReservedVideoDescription17", 17, SlotOf(&IVideoSampleDescription::ReservedVideoDescription17)},
+    {"IVideoSampleDescription::GetVendor", 18, SlotOf(&IVideoSampleDescription::GetVendor)},
+    {"IVideoSampleDescription::GetImageAspectRatio", 19, SlotOf(&IVideoSampleDescription::GetImageAspectRatio)},
+    {"IVideoSampleDescription::GetVideoColorSpaceDetails", 20, SlotOf(&IVideoSampleDescription::GetVideoColorSpaceDetails)},
+    {"IVideoSampleDescription::ReservedVideoDescription21", 21, SlotOf(&IVideoSampleDescription::ReservedVideoDescription21)},
+    {"IVideoSampleDescription::ReservedVideoDescription22", 22, SlotOf(&IVideoSampleDescription::ReservedVideoDescription22)},
+    {"IVideoSampleDescription::ReservedVideoDescription23", 23, SlotOf(&IVideoSampleDescription::ReservedVideoDescription23)},
+    {"IVideoSampleDescription::GetNivoAlphaCodingCount", 24, SlotOf(&IVideoSampleDescription::GetNivoAlphaCodingCount)},
+    {"IVideoSampleDescription::GetNivoAlphaCoding", 25, SlotOf(&IVideoSampleDescription::GetNivoAlphaCoding)},
+    {"IVideoSampleDescription::GetNivoResolution", 26, SlotOf(&IVideoSampleDescription::GetNivoResolution)},
+    {"IVideoSampleDescription::ReservedVideoDescription27", 27, SlotOf(&IVideoSampleDescription::ReservedVideoDescription27)},
+    {"IVideoSampleDescription::ReservedVideoDescription28", 28, SlotOf(&IVideoSampleDescription::ReservedVideoDescription28)},
+    {"IVideoSampleDescription::GetRIAttributes", 29, SlotOf(&IVideoSampleDescription::GetRIAttributes)},
+    {"IVideoSampleDescription::GetCMAttributes", 30, SlotOf(&IVideoSampleDescription::GetCMAttributes)},
+    {"IAudioSampleDescription::ReservedAudioDescription3", 3, SlotOf(&IAudioSampleDescription::ReservedAudioDescription3)},
+    {"IAudioSampleDescription::ReservedAudioDescription4", 4, SlotOf(&IAudioSampleDescription::ReservedAudioDescription4)},
+    {"IAudioSampleDescription::GetChannelsPerFrame", 5, SlotOf(&IAudioSampleDescription::GetChannelsPerFrame)},
+    {"IAudioSampleDescription::GetBitsPerChannel", 6, SlotOf(&IAudioSampleDescription::GetBitsPerChannel)},
+    {"IAudioSampleDescription::GetSampleRate", 7, SlotOf(&IAudioSampleDescription::GetSampleRate)},
+    {"IAudioSampleDescription::IsConstantBitRate", 8, SlotOf(&IAudioSampleDescription::IsConstantBitRate)},
+    {"IAudioSampleDescription::IsLPCM", 9, SlotOf(&IAudioSampleDescription::IsLPCM)},
+    {"IAudioSampleDescription::GetBytesPerPacket", 10, SlotOf(&IAudioSampleDescription::GetBytesPerPacket)},
+    {"IAudioSampleDescription::IsLittleEndian", 11, SlotOf(&IAudioSampleDescription::IsLittleEndian)},
+    {"IQTSampleTable::GetNumSamples", 3, SlotOf(&IQTSampleTable::GetNumSamples)},
+    {"IQTSampleTable::GetDataOffset", 4, SlotOf(&IQTSampleTable::GetDataOffset)},
+    {"IQTSampleTable::GetSampleFlags", 5, SlotOf(&IQTSampleTable::GetSampleFlags)},
+    {"IQTSampleTable::GetNextDiscontiguousDataAttributeChange", 6, SlotOf(&IQTSampleTable::GetNextDiscontiguousDataAttributeChange)},
+    {"IQTSampleTable::GetDataSizePerSample", 7, SlotOf(&IQTSampleTable::GetDataSizePerSample)},
+    {"IQTSampleTable::GetDisplayOffset", 8, SlotOf(&IQTSampleTable::GetDisplayOffset)},
+    {"IQTSampleTable::GetDecodeDuration", 9, SlotOf(&IQTSampleTable::GetDecodeDuration)},
+    {"IQTSampleTable::GetMaxDataSizeInBytes", 10, SlotOf(&IQTSampleTable::GetMaxDataSizeInBytes)},
+    {"IQTSampleTable::GetHasOutOfOrderFrameDependencies", 11, SlotOf(&IQTSampleTable::GetHasOutOfOrderFrameDependencies)},
+    {"IQTSampleTable::GetChunkFromTheMiddle", 12, SlotOf(&IQTSampleTable::GetChunkFromTheMiddle)},
+    {"IQTSampleTable::DisplayTimeToFrameNum", 13, SlotOf(&IQTSampleTable::DisplayTimeToFrameNum)},
+    {"IVideoTrackInfo::ReservedTrack3", 3, SlotOf(&IVideoTrackInfo::ReservedTrack3)},
+    {"IVideoTrackInfo::ReservedTrack4", 4, SlotOf(&IVideoTrackInfo::ReservedTrack4)},
+    {"IVideoTrackInfo::ReservedTrack5", 5, SlotOf(&IVideoTrackInfo::ReservedTrack5)},
+    {"IVideoTrackInfo::ReservedTrack6", 6, SlotOf(&IVideoTrackInfo::ReservedTrack6)},
+    {"IVideoTrackInfo::ReservedTrack7", 7, SlotOf(&IVideoTrackInfo::ReservedTrack7)},
+    {"IVideoTrackInfo::GetTrackId", 8, SlotOf(&IVideoTrackInfo::GetTrackId)},
+    {"IVideoTrackInfo::GetTrackDuration", 9, SlotOf(&IVideoTrackInfo::GetTrackDuration)},
+    {"IVideoTrackInfo::IsTrackLinear", 10, SlotOf(&IVideoTrackInfo::IsTrackLinear)},
+    {"IVideoTrackInfo::TrackTimeToMediaTime", 11, SlotOf(&IVideoTrackInfo::TrackTimeToMediaTime)},
+    {"IVideoTrackInfo::ReservedTrack12", 12, SlotOf(&IVideoTrackInfo::ReservedTrack12)},
+    {"IVideoTrackInfo::ReservedTrack13", 13, SlotOf(&IVideoTrackInfo::ReservedTrack13)},
+    {"IVideoTrackInfo::GetMediaTS", 14, SlotOf(&IVideoTrackInfo::GetMediaTS)},
+    {"IVideoTrackInfo::GetMediaDuration", 15, SlotOf(&IVideoTrackInfo::GetMediaDuration)},
+    {"IVideoTrackInfo::GetSampleTable", 16, SlotOf(&IVideoTrackInfo::GetSampleTable)},
+    {"IVideoTrackInfo::GetSampleDescriptionCount", 17, SlotOf(&IVideoTrackInfo::GetSampleDescriptionCount)},
+    {"IVideoTrackInfo::ReservedTrack18", 18, SlotOf(&IVideoTrackInfo::ReservedTrack18)},
+    {"IVideoTrackInfo::ReservedTrack19", 19, SlotOf(&IVideoTrackInfo::ReservedTrack19)},
+    {"IVideoTrackInfo::ReservedTrack20", 20, SlotOf(&IVideoTrackInfo::ReservedTrack20)},
+    {"IVideoTrackInfo::ReservedTrack21", 21, SlotOf(&IVideoTrackInfo::ReservedTrack21)},
+    {"IVideoTrackInfo::GetTrackMatrix", 22, SlotOf(&IVideoTrackInfo::GetTrackMatrix)},
+    {"IVideoTrackInfo::ReservedVideoTrack23", 23, SlotOf(&IVideoTrackInfo::ReservedVideoTrack23)},
+    {"IVideoTrackInfo::GetVideoSampleDescription", 24, SlotOf(&IVideoTrackInfo::GetVideoSampleDescription)},
+    {"IAudioTrackInfo::ReservedTrack3", 3, SlotOf(&IAudioTrackInfo::ReservedTrack3)},
+    {"IAudioTrackInfo::ReservedTrack4", 4, SlotOf(&IAudioTrackInfo::ReservedTrack4)},
+    {"IAudioTrackInfo::ReservedTrack5", 5, SlotOf(&IAudioTrackInfo::ReservedTrack5)},
+    {"IAudioTrackInfo::ReservedTrack6", 6, SlotOf(&IAudioTrackInfo::ReservedTrack6)},
+    {"IAudioTrackInfo::ReservedTrack7", 7, SlotOf(&IAudioTrackInfo::ReservedTrack7)},
+    {"IAudioTrackInfo::GetTrackId", 8, SlotOf(&IAudioTrackInfo::GetTrackId)},
+    {"IAudioTrackInfo::GetTrackDuration", 9, SlotOf(&IAudioTrackInfo::GetTrackDuration)},
+    {"IAudioTrackInfo::IsTrackLinear", 10, SlotOf(&IAudioTrackInfo::IsTrackLinear)},
+    {"IAudioTrackInfo::TrackTimeToMediaTime", 11, SlotOf(&IAudioTrackInfo::TrackTimeToMediaTime)},
+    {"IAudioTrackInfo::ReservedTrack12", 12, SlotOf(&IAudioTrackInfo::ReservedTrack12)},
+    {"IAudioTrackInfo::ReservedTrack13", 13, SlotOf(&IAudioTrackInfo::ReservedTrack13)},
+    {"IAudioTrackInfo::GetMediaTS", 14, SlotOf(&IAudioTrackInfo::GetMediaTS)},
+    {"IAudioTrackInfo::GetMediaDuration", 15, SlotOf(&IAudioTrackInfo::GetMediaDuration)},
+    {"IAudioTrackInfo::GetSampleTable", 16, SlotOf(&IAudioTrackInfo::GetSampleTable)},
+    {"IAudioTrackInfo::GetSampleDescriptionCount", 17, SlotOf(&IAudioTrackInfo::GetSampleDescriptionCount)},
+    {"IAudioTrackInfo::ReservedTrack18", 18, SlotOf(&IAudioTrackInfo::ReservedTrack18)},
+    {"IAudioTrackInfo::ReservedTrack19", 19, SlotOf(&IAudioTrackInfo::ReservedTrack19)},
+    {"IAudioTrackInfo::ReservedTrack20", 20, SlotOf(&IAudioTrackInfo::ReservedTrack20)},
+    {"IAudioTrackInfo::ReservedTrack21", 21, SlotOf(&IAudioTrackInfo::ReservedTrack21)},
+    {"IAudioTrackInfo::HasConstantSampleRate", 22, SlotOf(&IAudioTrackInfo::HasConstantSampleRate)},
+    {"IAudioTrackInfo::GetAudioSampleDescription", 23, SlotOf(&IAudioTrackInfo::GetAudioSampleDescription)},
 };
+// clang-format on
 
-TEST(Places, OfIQTParser) {
-    ExpectPlaces<PlacesIQTParser>({
-        {3, "GetCreationTime"}, {4, "ReservedParser4"}, {5, "GetTimeScale"},
-        {6, "GetMovieDuration"}, {7, "ReservedParser7"}, {8, "ReservedParser8"},
-        {9, "ReservedParser9"}, {10, "GetVideoTrackCount"}, {11, "GetAudioTrackCount"},
-        {12, "GetTimeCodeTrackCount"}, {13, "GetOtherTrackCount"}, {14, "GetVideoTrackInfo"},
-        {15, "GetAudioTrackInfo"}, {16, "GetTimeCodeTrackInfo"}, {17, "GetOtherTrackInfo"},
-        {18, "ParseHeaders"}, {19, "GetRecomendedReadPosition"}, {20, "GetTimeCodeInfo"},
-        {21, "IsMovieSelfContained"}, {22, "GetMOOVAtom"},
-    });
-}
-
-struct PlacesIQTParserColor : PlaceFake<IQTParserColor> {
-    ncfUInt32 ColorFlagA() override { return Ran<ncfUInt32>("ColorFlagA"); }
-    ncfUInt32 ColorFlagB() override { return Ran<ncfUInt32>("ColorFlagB"); }
-};
-
-TEST(Places, OfIQTParserColor) {
-    ExpectPlaces<PlacesIQTParserColor>({
-        {3, "ColorFlagA"}, {4, "ColorFlagB"},
-    });
-}
-
-struct PlacesIVideoSampleDescription : PlaceFake<IVideoSampleDescription> {
-    NCFRESULT GetDataFormat(ncfUInt32*) override { return Ran<NCFRESULT>("GetDataFormat"); }
-    NCFRESULT ReservedVideoDescription4() override { return Ran<NCFRESULT>("ReservedVideoDescription4"); }
-    NCFRESULT GetEncodedWidthAndHeight(ncfUInt16*, ncfUInt16*) override { return Ran<NCFRESULT>("GetEncodedWidthAndHeight"); }
-    NCFRESULT ReservedVideoDescription6() override { return Ran<NCFRESULT>("ReservedVideoDescription6"); }
-    NCFRESULT ReservedVideoDescription7() override { return Ran<NCFRESULT>("ReservedVideoDescription7"); }
-    NCFRESULT ReservedVideoDescription8() override { return Ran<NCFRESULT>("ReservedVideoDescription8"); }
-    NCFRESULT ReservedVideoDescription9() override { return Ran<NCFRESULT>("ReservedVideoDescription9"); }
-    NCFRESULT HasAlpha(ncfSInt32*) override { return Ran<NCFRESULT>("HasAlpha"); }
-    NCFRESULT ReservedVideoDescription11() override { return Ran<NCFRESULT>("ReservedVideoDescription11"); }
-    NCFRESULT GetFieldInfo(ncfUInt32*, ncfUInt32*, ncfUInt32*) override { return Ran<NCFRESULT>("GetFieldInfo"); }
-    NCFRESULT ReservedVideoDescription13() override { return Ran<NCFRESULT>("ReservedVideoDescription13"); }
-    NCFRESULT ReservedVideoDescription14() override { return Ran<NCFRESULT>("ReservedVideoDescription14"); }
-    NCFRESULT ReservedVideoDescription15() override { return Ran<NCFRESULT>("ReservedVideoDescription15"); }
-    NCFRESULT ReservedVideoDescription16() override { return Ran<NCFRESULT>("ReservedVideoDescription16"); }
-    NCFRESULT ReservedVideoDescription17() override { return Ran<NCFRESULT>("ReservedVideoDescription17"); }
-    NCFRESULT GetVendor(ncfUInt32*) override { return Ran<NCFRESULT>("GetVendor"); }
-    NCFRESULT GetImageAspectRatio(ncfUInt32*, ncfUInt32*) override { return Ran<NCFRESULT>("GetImageAspectRatio"); }
-    NCFRESULT GetVideoColorSpaceDetails(ncfUInt32*) override { return Ran<NCFRESULT>("GetVideoColorSpaceDetails"); }
-    NCFRESULT ReservedVideoDescription21() override { return Ran<NCFRESULT>("ReservedVideoDescription21"); }
-    NCFRESULT ReservedVideoDescription22() override { return Ran<NCFRESULT>("ReservedVideoDescription22"); }
-    NCFRESULT ReservedVideoDescription23() override { return Ran<NCFRESULT>("ReservedVideoDescription23"); }
-    NCFRESULT GetNivoAlphaCodingCount(ncfUInt32*) override { return Ran<NCFRESULT>("GetNivoAlphaCodingCount"); }
-    NCFRESULT GetNivoAlphaCoding(ncfUInt32, ncfUInt32*) override { return Ran<NCFRESULT>("GetNivoAlphaCoding"); }
-    NCFRESULT GetNivoResolution(QTNivoResolution*) override { return Ran<NCFRESULT>("GetNivoResolution"); }
-    NCFRESULT ReservedVideoDescription27() override { return Ran<NCFRESULT>("ReservedVideoDescription27"); }
-    NCFRESULT ReservedVideoDescription28() override { return Ran<NCFRESULT>("ReservedVideoDescription28"); }
-    NCFRESULT GetRIAttributes(INCFString**) override { return Ran<NCFRESULT>("GetRIAttributes"); }
-    NCFRESULT GetCMAttributes(INCFString**) override { return Ran<NCFRESULT>("GetCMAttributes"); }
-};
-
-TEST(Places, OfIVideoSampleDescription) {
-    ExpectPlaces<PlacesIVideoSampleDescription>({
-        {3, "GetDataFormat"}, {4, "ReservedVideoDescription4"}, {5, "GetEncodedWidthAndHeight"},
-        {6, "ReservedVideoDescription6"}, {7, "ReservedVideoDescription7"},
-        {8, "ReservedVideoDescription8"}, {9, "ReservedVideoDescription9"}, {10, "HasAlpha"},
-        {11, "ReservedVideoDescription11"}, {12, "GetFieldInfo"},
-        {13, "ReservedVideoDescription13"}, {14, "ReservedVideoDescription14"},
-        {15, "ReservedVideoDescription15"}, {16, "ReservedVideoDescription16"},
-        {17, "ReservedVideoDescription17"}, {18, "GetVendor"}, {19, "GetImageAspectRatio"},
-        {20, "GetVideoColorSpaceDetails"}, {21, "ReservedVideoDescription21"},
-        {22, "ReservedVideoDescription22"}, {23, "ReservedVideoDescription23"},
-        {24, "GetNivoAlphaCodingCount"}, {25, "GetNivoAlphaCoding"}, {26, "GetNivoResolution"},
-        {27, "ReservedVideoDescription27"}, {28, "ReservedVideoDescription28"},
-        {29, "GetRIAttributes"}, {30, "GetCMAttributes"},
-    });
-}
-
-struct PlacesIAudioSampleDescription : PlaceFake<IAudioSampleDescription> {
-    NCFRESULT ReservedAudioDescription3() override { return Ran<NCFRESULT>("ReservedAudioDescription3"); }
-    NCFRESULT ReservedAudioDescription4() override { return Ran<NCFRESULT>("ReservedAudioDescription4"); }
-    NCFRESULT GetChannelsPerFrame(ncfUInt32*) override { return Ran<NCFRESULT>("GetChannelsPerFrame"); }
-    NCFRESULT GetBitsPerChannel(ncfUInt32*) override { return Ran<NCFRESULT>("GetBitsPerChannel"); }
-    NCFRESULT GetSampleRate(double*) override { return Ran<NCFRESULT>("GetSampleRate"); }
-    NCFRESULT IsConstantBitRate(ncfBool*) override { return Ran<NCFRESULT>("IsConstantBitRate"); }
-    NCFRESULT IsLPCM(ncfBool*) override { return Ran<NCFRESULT>("IsLPCM"); }
-    NCFRESULT GetBytesPerPacket(ncfUInt32*) override { return Ran<NCFRESULT>("GetBytesPerPacket"); }
-    NCFRESULT IsLittleEndian(ncfBool*) override { return Ran<NCFRESULT>("IsLittleEndian"); }
-};
-
-TEST(Places, OfIAudioSampleDescription) {
-    ExpectPlaces<PlacesIAudioSampleDescription>({
-        {3, "ReservedAudioDescription3"}, {4, "ReservedAudioDescription4"},
-        {5, "GetChannelsPerFrame"}, {6, "GetBitsPerChannel"}, {7, "GetSampleRate"},
-        {8, "IsConstantBitRate"}, {9, "IsLPCM"}, {10, "GetBytesPerPacket"},
-        {11, "IsLittleEndian"},
-    });
-}
-
-struct PlacesIQTSampleTable : PlaceFake<IQTSampleTable> {
-    NCFRESULT GetNumSamples(ncfUInt64*) override { return Ran<NCFRESULT>("GetNumSamples"); }
-    NCFRESULT GetDataOffset(ncfUInt64, ncfUInt64*) override { return Ran<NCFRESULT>("GetDataOffset"); }
-    NCFRESULT GetSampleFlags(ncfUInt64, ncfUInt32*) override { return Ran<NCFRESULT>("GetSampleFlags"); }
-    NCFRESULT GetNextDiscontiguousDataAttributeChange(ncfUInt64, ncfUInt64*) override { return Ran<NCFRESULT>("GetNextDiscontiguousDataAttributeChange"); }
-    NCFRESULT GetDataSizePerSample(ncfUInt64, ncfUInt32*) override { return Ran<NCFRESULT>("GetDataSizePerSample"); }
-    NCFRESULT GetDisplayOffset(ncfUInt64, ncfSInt64*) override { return Ran<NCFRESULT>("GetDisplayOffset"); }
-    NCFRESULT GetDecodeDuration(ncfUInt64, ncfSInt64*) override { return Ran<NCFRESULT>("GetDecodeDuration"); }
-    NCFRESULT GetMaxDataSizeInBytes(ncfUInt32*) override { return Ran<NCFRESULT>("GetMaxDataSizeInBytes"); }
-    NCFRESULT GetHasOutOfOrderFrameDependencies(ncfBool*) override { return Ran<NCFRESULT>("GetHasOutOfOrderFrameDependencies"); }
-    NCFRESULT GetChunkFromTheMiddle(ncfUInt64*, ncfUInt64*) override { return Ran<NCFRESULT>("GetChunkFromTheMiddle"); }
-    NCFRESULT DisplayTimeToFrameNum(ncfUInt64, ncfUInt64*) override { return Ran<NCFRESULT>("DisplayTimeToFrameNum"); }
-};
-
-TEST(Places, OfIQTSampleTable) {
-    ExpectPlaces<PlacesIQTSampleTable>({
-        {3, "GetNumSamples"}, {4, "GetDataOffset"}, {5, "GetSampleFlags"},
-        {6, "GetNextDiscontiguousDataAttributeChange"}, {7, "GetDataSizePerSample"},
-        {8, "GetDisplayOffset"}, {9, "GetDecodeDuration"}, {10, "GetMaxDataSizeInBytes"},
-        {11, "GetHasOutOfOrderFrameDependencies"}, {12, "GetChunkFromTheMiddle"},
-        {13, "DisplayTimeToFrameNum"},
-    });
-}
-
-struct PlacesIVideoTrackInfo : PlaceFake<IVideoTrackInfo> {
-    NCFRESULT ReservedTrack3() override { return Ran<NCFRESULT>("ReservedTrack3"); }
-    NCFRESULT ReservedTrack4() override { return Ran<NCFRESULT>("ReservedTrack4"); }
-    NCFRESULT ReservedTrack5() override { return Ran<NCFRESULT>("ReservedTrack5"); }
-    NCFRESULT ReservedTrack6() override { return Ran<NCFRESULT>("ReservedTrack6"); }
-    NCFRESULT ReservedTrack7() override { return Ran<NCFRESULT>("ReservedTrack7"); }
-    NCFRESULT GetTrackId(ncfUInt32*) override { return Ran<NCFRESULT>("GetTrackId"); }
-    NCFRESULT GetTrackDuration(ncfUInt32*) override { return Ran<NCFRESULT>("GetTrackDuration"); }
-    NCFRESULT IsTrackLinear(ncfBool*, ncfBool*, ncfSInt64*, ncfUInt32*) override { return Ran<NCFRESULT>("IsTrackLinear"); }
-    NCFRESULT TrackTimeToMediaTime(ncfUInt64, ncfSInt64*) override { return Ran<NCFRESULT>("TrackTimeToMediaTime"); }
-    NCFRESULT ReservedTrack12() override { return Ran<NCFRESULT>("ReservedTrack12"); }
-    NCFRESULT ReservedTrack13() override { return Ran<NCFRESULT>("ReservedTrack13"); }
-    NCFRESULT GetMediaTS(ncfUInt32*) override { return Ran<NCFRESULT>("GetMediaTS"); }
-    NCFRESULT GetMediaDuration(ncfUInt32*) override { return Ran<NCFRESULT>("GetMediaDuration"); }
-    NCFRESULT GetSampleTable(IQTSampleTable**) override { return Ran<NCFRESULT>("GetSampleTable"); }
-    NCFRESULT GetSampleDescriptionCount(ncfUInt32*) override { return Ran<NCFRESULT>("GetSampleDescriptionCount"); }
-    NCFRESULT ReservedTrack18() override { return Ran<NCFRESULT>("ReservedTrack18"); }
-    NCFRESULT ReservedTrack19() override { return Ran<NCFRESULT>("ReservedTrack19"); }
-    NCFRESULT ReservedTrack20() override { return Ran<NCFRESULT>("ReservedTrack20"); }
-    NCFRESULT ReservedTrack21() override { return Ran<NCFRESULT>("ReservedTrack21"); }
-    NCFRESULT GetTrackMatrix(float*) override { return Ran<NCFRESULT>("GetTrackMatrix"); }
-    NCFRESULT ReservedVideoTrack23() override { return Ran<NCFRESULT>("ReservedVideoTrack23"); }
-    NCFRESULT GetVideoSampleDescription(ncfUInt32, IVideoSampleDescription**) override { return Ran<NCFRESULT>("GetVideoSampleDescription"); }
-};
-
-TEST(Places, OfIVideoTrackInfo) {
-    ExpectPlaces<PlacesIVideoTrackInfo>({
-        {3, "ReservedTrack3"}, {4, "ReservedTrack4"}, {5, "ReservedTrack5"},
-        {6, "ReservedTrack6"}, {7, "ReservedTrack7"}, {8, "GetTrackId"}, {9, "GetTrackDuration"},
-        {10, "IsTrackLinear"}, {11, "TrackTimeToMediaTime"}, {12, "ReservedTrack12"},
-        {13, "ReservedTrack13"}, {14, "GetMediaTS"}, {15, "GetMediaDuration"},
-        {16, "GetSampleTable"}, {17, "GetSampleDescriptionCount"}, {18, "ReservedTrack18"},
-        {19, "ReservedTrack19"}, {20, "ReservedTrack20"}, {21, "ReservedTrack21"},
-        {22, "GetTrackMatrix"}, {23, "ReservedVideoTrack23"}, {24, "GetVideoSampleDescription"},
-    });
-}
-
-struct PlacesIAudioTrackInfo : PlaceFake<IAudioTrackInfo> {
-    NCFRESULT ReservedTrack3() override { return Ran<NCFRESULT>("ReservedTrack3"); }
-    NCFRESULT ReservedTrack4() override { return Ran<NCFRESULT>("ReservedTrack4"); }
-    NCFRESULT ReservedTrack5() override { return Ran<NCFRESULT>("ReservedTrack5"); }
-    NCFRESULT ReservedTrack6() override { return Ran<NCFRESULT>("ReservedTrack6"); }
-    NCFRESULT ReservedTrack7() override { return Ran<NCFRESULT>("ReservedTrack7"); }
-    NCFRESULT GetTrackId(ncfUInt32*) override { return Ran<NCFRESULT>("GetTrackId"); }
-    NCFRESULT GetTrackDuration(ncfUInt32*) override { return Ran<NCFRESULT>("GetTrackDuration"); }
-    NCFRESULT IsTrackLinear(ncfBool*, ncfBool*, ncfSInt64*, ncfUInt32*) override { return Ran<NCFRESULT>("IsTrackLinear"); }
-    NCFRESULT TrackTimeToMediaTime(ncfUInt64, ncfSInt64*) override { return Ran<NCFRESULT>("TrackTimeToMediaTime"); }
-    NCFRESULT ReservedTrack12() override { return Ran<NCFRESULT>("ReservedTrack12"); }
-    NCFRESULT ReservedTrack13() override { return Ran<NCFRESULT>("ReservedTrack13"); }
-    NCFRESULT GetMediaTS(ncfUInt32*) override { return Ran<NCFRESULT>("GetMediaTS"); }
-    NCFRESULT GetMediaDuration(ncfUInt32*) override { return Ran<NCFRESULT>("GetMediaDuration"); }
-    NCFRESULT GetSampleTable(IQTSampleTable**) override { return Ran<NCFRESULT>("GetSampleTable"); }
-    NCFRESULT GetSampleDescriptionCount(ncfUInt32*) override { return Ran<NCFRESULT>("GetSampleDescriptionCount"); }
-    NCFRESULT ReservedTrack18() override { return Ran<NCFRESULT>("ReservedTrack18"); }
-    NCFRESULT ReservedTrack19() override { return Ran<NCFRESULT>("ReservedTrack19"); }
-    NCFRESULT ReservedTrack20() override { return Ran<NCFRESULT>("ReservedTrack20"); }
-    NCFRESULT ReservedTrack21() override { return Ran<NCFRESULT>("ReservedTrack21"); }
-    NCFRESULT HasConstantSampleRate(ncfUInt32*) override { return Ran<NCFRESULT>("HasConstantSampleRate"); }
-    NCFRESULT GetAudioSampleDescription(ncfUInt32, IAudioSampleDescription**) override { return Ran<NCFRESULT>("GetAudioSampleDescription"); }
-};
-
-TEST(Places, OfIAudioTrackInfo) {
-    ExpectPlaces<PlacesIAudioTrackInfo>({
-        {3, "ReservedTrack3"}, {4, "ReservedTrack4"}, {5, "ReservedTrack5"},
-        {6, "ReservedTrack6"}, {7, "ReservedTrack7"}, {8, "GetTrackId"}, {9, "GetTrackDuration"},
-        {10, "IsTrackLinear"}, {11, "TrackTimeToMediaTime"}, {12, "ReservedTrack12"},
-        {13, "ReservedTrack13"}, {14, "GetMediaTS"}, {15, "GetMediaDuration"},
-        {16, "GetSampleTable"}, {17, "GetSampleDescriptionCount"}, {18, "ReservedTrack18"},
-        {19, "ReservedTrack19"}, {20, "ReservedTrack20"}, {21, "ReservedTrack21"},
-        {22, "HasConstantSampleRate"}, {23, "GetAudioSampleDescription"},
-    });
+TEST(HeaderParserInterfaces, HaveTheirOperationsInTheirPlaces) {
+    ExpectPublishedPlaces(kSlots);
 }
 
 }  // namespace
-// clang-format on

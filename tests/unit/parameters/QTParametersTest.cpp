@@ -96,9 +96,9 @@ TEST_F(QTParametersObject, RefusesOneOperationSilently) {
 TEST_F(QTParametersObject, CannotBelongToAMappingWithoutAClip) {
     MakeUnattached();
     EXPECT_EQ(object().AttachToQTSampleProvider(*mapping), NCF_E_FAIL);
-    EXPECT_EQ(log->count("NCFASSERT( sampleProvider.GetMediaClip() )"
-                         "NMA::Impl::QTParameters::AttachToQTSampleProvider"),
-              1);
+    EXPECT_TRUE(
+        log->once("NCFASSERT( sampleProvider.GetMediaClip() )"
+                  "NMA::Impl::QTParameters::AttachToQTSampleProvider"));
     EXPECT_EQ(parameters->GetDefaultValuesXML(xml.inArg()), NMA_E_NOTINITIALIZED);
     EXPECT_EQ(static_cast<NMA::ISampleMapping*>(mapping)->AddRef(), 3u)
         << "the reference was taken before the clip was missed";

@@ -168,9 +168,8 @@ TEST_F(UtilAnswersTest, TheRetrieverIsStartedAfterTimecodeAndMustBeThere) {
     clip->videoTracks = 1;
     EXPECT_EQ(Describe(), NCF_E_FAIL);
     EXPECT_THAT(Asked("Init"), ElementsAre("Init FourCharMapper.xml AAFInfo.xml"));
-    EXPECT_EQ(
-        log.count(std::string("NCFASSERT( QuickTimeToAAFInfoRetriever::GetInstance() )") + kTracks),
-        1);
+    EXPECT_TRUE(
+        log.once(std::string("NCFASSERT( QuickTimeToAAFInfoRetriever::GetInstance() )") + kTracks));
     EXPECT_GE(aaf.place("SourceMob2Slot1.SetPhysicalNum"), 0);
     EXPECT_EQ(aaf.place("MultipleDescriptor1.AppendFileDescriptor"), -1);
 

@@ -3,8 +3,6 @@
 
 #include "tests/unit/aaf/support/DescriptionHost.h"
 
-#include <cstdio>
-
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 
 namespace {
@@ -97,11 +95,4 @@ void DescriptionHost::MakeNative(const char* code) {
     for (int i = 0; i < 4; ++i) {
         clip->code = clip->code << 8 | static_cast<unsigned char>(code[i]);
     }
-}
-
-std::string ReturnRecord(NCFRESULT result, const std::string& statement,
-                         const std::string& function) {
-    char code[12];
-    std::snprintf(code, sizeof code, "%x", static_cast<unsigned>(result));
-    return std::string("NCF_RETURN(0x") + code + "): " + statement + " : " + function;
 }

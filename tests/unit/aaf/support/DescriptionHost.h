@@ -36,7 +36,3 @@ protected:
     std::tr1::shared_ptr<FakeClip> clip;
     RecordingNMALog lines{1};
 };
-
-// The record of a failed NCF_RETURN.
-std::string ReturnRecord(NCFRESULT result, const std::string& statement,
-                         const std::string& function);

@@ -12,6 +12,7 @@
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "tests/support/fakes/FakeHost.h"
 #include "tests/support/fakes/Journal.h"
+#include "tests/support/fakes/StubClip.h"
 
 struct FakeSoundTrack {
     ncfUInt32 qtTrack = 2;
@@ -30,10 +31,10 @@ struct FakeTimecodeTrack {
 // A clip that answers what a test sets, and fails the operations that it names.
 // Rate and length are there from SetEditRate and SetMovieLength on, as in a
 // real clip, or after SetTiming.
-class FakeClip final : public BaseClip {
+class FakeClip final : public StubClip {
 public:
     FakeClip(const std::string& path, FakeHost& host, Journal* journal)
-        : BaseClip(Path(path), NCFSmartPtr<INCFConsole>(&host.console()),
+        : StubClip(Path(path), NCFSmartPtr<INCFConsole>(&host.console()),
                    NCFSmartPtr<INCFComponentFactory>(host.factory())),
           journal_(journal) {}
 
@@ -183,39 +184,6 @@ public:
     NCFRESULT GetAudioTrackCountImpl(ncfUInt32* out) override {
         return answer("GetAudioTrackCount", out, static_cast<ncfUInt32>(sound.size()));
     }
-
-    // --- no description asks these ---------------------------------------------------
-    NCFRESULT SetFieldLayoutDetails() override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetTrackCount(ncfUInt32*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetVideoTrackQTId(ncfUInt32, ncfUInt32&) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetTrackType(ncfUInt32, ncfUInt32*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT IsAudioLPCM(ncfUInt32, ncfBool*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetCreationTime(ncfUInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT IsSelfContained() override { return NCF_E_NOTIMPL; }
-    NCFRESULT HasOneFrame(ncfBool*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT IsMultiFormatMovie(ncfBool*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetNumSamples(ncfUInt32, ncfUInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetDataOffset(ncfUInt32, ncfUInt64, ncfUInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetSampleFlags(ncfUInt32, ncfUInt64, ncfUInt32*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetNextDiscontiguousDataAttributeChange(ncfUInt32, ncfUInt64, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetDataSizePerSample(ncfUInt32, ncfUInt64, ncfUInt32*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetDisplayOffset(ncfUInt32, ncfUInt64, ncfSInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetDecodeDuration(ncfUInt32, ncfUInt64, ncfSInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetMaxDataSizeInBytes(ncfUInt32, ncfUInt32*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetHasOutOfOrderFrameDependencies(ncfUInt32, ncfBool*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT LoadClipImpl() override { return NCF_E_NOTIMPL; }
-    NCFRESULT SetColorSpaceImpl() override { return NCF_E_NOTIMPL; }
-    NCFRESULT SetGeometryImpl() override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetEncodedWidthAndHeightImpl(ncfUInt32*, ncfUInt32*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetImageAspectRatioImpl(ncfUInt32*, ncfUInt32*) override { return NCF_E_NOTIMPL; }
 
 private:
     static NCFSmartPtr<INCFString> Path(const std::string& path) {

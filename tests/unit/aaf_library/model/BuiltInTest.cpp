@@ -65,9 +65,7 @@ TEST_F(BuiltInModel, EveryClassComesIntoBeingAsItsRowTells) {
         EXPECT_EQ(definition->GetName(name, sizeof name), AAFRESULT_SUCCESS);
         EXPECT_EQ(std::wstring(name), aaf::Widen(entry.name));
     }
-    aafUInt32 count = 0;
-    EXPECT_EQ(dictionary->CountClassDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 102u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountClassDefs), 102u);
 }
 
 TEST_F(BuiltInModel, EveryTypeComesIntoBeingAsItsRowTells) {
@@ -81,9 +79,7 @@ TEST_F(BuiltInModel, EveryTypeComesIntoBeingAsItsRowTells) {
         EXPECT_EQ(meta->GetAUID(&id), AAFRESULT_SUCCESS);
         EXPECT_TRUE(id == entry.id) << entry.symbol;
     }
-    aafUInt32 count = 0;
-    EXPECT_EQ(dictionary->CountTypeDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 154u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountTypeDefs), 154u);
 }
 
 TEST_F(BuiltInModel, CategoriesOfTypesAreThePublishedNumbers) {
@@ -131,14 +127,10 @@ TEST_F(BuiltInModel, RecordsHaveTheLayoutOfTheirStructures) {
 }
 
 TEST_F(BuiltInModel, NewDictionaryListsWhatIsUsedFromTheStart) {
-    aafUInt32 count = 0;
-    EXPECT_EQ(dictionary->CountClassDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 37u);
-    EXPECT_EQ(dictionary->CountTypeDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 72u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountClassDefs), 37u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountTypeDefs), 72u);
     Class(AUID_AAFMasterMob);
-    EXPECT_EQ(dictionary->CountClassDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 38u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountClassDefs), 38u);
 }
 
 }  // namespace

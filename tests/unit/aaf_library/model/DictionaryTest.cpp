@@ -27,15 +27,10 @@ TEST_F(DictionaryOfAFile, LookUpsOfUnknownIdsLeaveTheOutputAlone) {
 }
 
 TEST_F(DictionaryOfAFile, StartsWithTheBuiltInDefinitions) {
-    aafUInt32 count = 0;
-    EXPECT_EQ(dictionary->CountDataDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 11u);
-    EXPECT_EQ(dictionary->CountContainerDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 93u);
-    EXPECT_EQ(dictionary->CountCodecDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 0u);
-    EXPECT_EQ(dictionary->CountOperationDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 0u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountDataDefs), 11u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountContainerDefs), 93u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountCodecDefs), 0u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountOperationDefs), 0u);
 }
 
 TEST_F(DictionaryOfAFile, BuiltInDefinitionsHaveNameAndDescription) {
@@ -153,9 +148,7 @@ TEST_F(DictionaryOfAFile, ContainerDefinitionsRegisterOnce) {
     const auto twin = As<IAAFContainerDef>(New(AUID_AAFContainerDefinition));
     ASSERT_EQ(twin->Initialize(kOwnId, L"Twin", L""), AAFRESULT_SUCCESS);
     EXPECT_EQ(dictionary->RegisterContainerDef(twin.get()), AAFRESULT_SUCCESS);
-    aafUInt32 count = 0;
-    EXPECT_EQ(dictionary->CountContainerDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 94u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountContainerDefs), 94u);
     EXPECT_EQ(Out<IAAFContainerDef>([&](IAAFContainerDef** out) {
                   return dictionary->LookupContainerDef(kOwnId, out);
               }).get(),
@@ -168,9 +161,7 @@ TEST_F(DictionaryOfAFile, DataDefinitionsRegisterTwiceInSilence) {
     ASSERT_EQ(own->Initialize(kOwnId, L"Own", L"Own"), AAFRESULT_SUCCESS);
     EXPECT_EQ(dictionary->RegisterDataDef(own.get()), AAFRESULT_SUCCESS);
     EXPECT_EQ(dictionary->RegisterDataDef(own.get()), AAFRESULT_SUCCESS);
-    aafUInt32 count = 0;
-    EXPECT_EQ(dictionary->CountDataDefs(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 12u);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountDataDefs), 12u);
 }
 
 TEST_F(DictionaryOfAFile, DefinitionsMayBeInitialisedAnewButNeedADescription) {

@@ -12,6 +12,7 @@
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
+#include "tests/unit/aaf_library/Get.h"
 
 // A model of its own for each test, seen through the published interfaces. The
 // classes of other rooms are not there, so their objects answer IAAFObject only.

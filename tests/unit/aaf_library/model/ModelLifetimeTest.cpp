@@ -38,9 +38,7 @@ TEST_F(ModelLifetime, ValueAloneKeepsItsTypeUsable) {
     const auto value = Int32Value(5);
     model = nullptr;
     const auto type = Out<IAAFTypeDef>([&](IAAFTypeDef** out) { return value->GetType(out); });
-    eAAFTypeCategory_t category = kAAFTypeCatUnknown;
-    EXPECT_EQ(type->GetTypeCategory(&category), AAFRESULT_SUCCESS);
-    EXPECT_EQ(category, kAAFTypeCatInt);
+    EXPECT_EQ(Get(type, &IAAFTypeDef::GetTypeCategory), kAAFTypeCatInt);
 }
 
 TEST_F(ModelLifetime, UnregisteredTypeOutlivesItsHolderForTheSakeOfValues) {

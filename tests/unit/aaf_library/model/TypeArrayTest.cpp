@@ -153,9 +153,7 @@ TEST_F(ArrayTypes, FixedArraysKeepTheirCount) {
     EXPECT_EQ(read[0], 8);
     EXPECT_EQ(read[1], 2);
     EXPECT_EQ(type->GetElementValue(value.get(), 8, &out), AAFRESULT_BADINDEX);
-    aafUInt32 count = 0;
-    EXPECT_EQ(type->GetCount(&count), AAFRESULT_SUCCESS);
-    EXPECT_EQ(count, 8u);
+    EXPECT_EQ(Get(type, &IAAFTypeDefFixedArray::GetCount), 8u);
 }
 
 TEST_F(ArrayTypes, SetsHoldEachElementOnce) {

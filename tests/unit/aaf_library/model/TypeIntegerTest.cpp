@@ -107,8 +107,7 @@ TEST_F(IntegerTypes, InitializeWorksOnce) {
     EXPECT_EQ(type->Initialize(kOwnId, 4, kAAFTrue, nullptr), AAFRESULT_NULL_PARAM);
     EXPECT_EQ(type->Initialize(kOwnId, 4, kAAFTrue, L"Own"), AAFRESULT_SUCCESS);
     EXPECT_EQ(type->Initialize(kOwnId, 4, kAAFTrue, L"Own"), AAFRESULT_ALREADY_INITIALIZED);
-    EXPECT_EQ(type->GetSize(&size), AAFRESULT_SUCCESS);
-    EXPECT_EQ(size, 4u);
+    EXPECT_EQ(::Get(type, &IAAFTypeDefInt::GetSize), 4u);
 }
 
 TEST_F(IntegerTypes, NullArgumentsAreRefused) {

@@ -88,17 +88,11 @@ TEST_F(ClipDescription, PutsLaterTimecodeBetweenFillers) {
     AddTimecode({1234, 1, 30}, 300, 2592000, 2, 1);
     Ptr<IAAFMobSlot> slot;
     Ptr<IAAFSegment> segment;
-    aafUInt32 number = 0;
-    aafUInt32 count = 0;
-    aafLength_t length = 0;
     ASSERT_EQ(AAFRESULT_SUCCESS, source_->LookupSlot(2, slot.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetPhysicalNum(&number));
-    EXPECT_EQ(3u, number);
+    EXPECT_EQ(3u, Get(slot, &IAAFMobSlot::GetPhysicalNum));
     ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFSequence>(segment)->CountComponents(&count));
-    EXPECT_EQ(3u, count);
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
-    EXPECT_EQ(2592000, length);
+    EXPECT_EQ(3u, Get(As<IAAFSequence>(segment), &IAAFSequence::CountComponents));
+    EXPECT_EQ(2592000, Get(As<IAAFComponent>(segment), &IAAFComponent::GetLength));
 }
 
 TEST_F(ClipDescription, HoldsPictureAndSoundInOneDescriptor) {
@@ -114,9 +108,7 @@ TEST_F(ClipDescription, HoldsPictureAndSoundInOneDescriptor) {
     EXPECT_EQ(30000, rate.numerator);
     Ptr<IAAFFileDescriptor> last;
     ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->GetFileDescriptorAt(2, last.Out()));
-    aafUInt32 bps = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFPCMDescriptor>(last)->GetAverageBPS(&bps));
-    EXPECT_EQ(1536000u, bps);
+    EXPECT_EQ(1536000u, Get(As<IAAFPCMDescriptor>(last), &IAAFPCMDescriptor::GetAverageBPS));
 }
 
 TEST_F(ClipDescription, KeepsTheBoxesOfAPicture) {

@@ -42,9 +42,7 @@ TEST_F(Component, RefusesNegativeLengths) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, filler->Initialize(nullptr, 5));
     EXPECT_EQ(AAFRESULT_SUCCESS, filler->Initialize(timecode, 0));
     EXPECT_EQ(AAFRESULT_SUCCESS, filler->Initialize(timecode, 7));
-    aafLength_t length = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(filler)->GetLength(&length));
-    EXPECT_EQ(7, length);
+    EXPECT_EQ(7, Get(As<IAAFComponent>(filler), &IAAFComponent::GetLength));
 }
 
 TEST_F(Component, TakesDataDefinitionsOfTheDictionaryOnly) {
@@ -76,10 +74,8 @@ TEST_F(Component, TakesTheLikeNamedDefinitionOfAnotherFile) {
 
 TEST_F(Component, KeepsCommentsAndAttributesWithTheirDuplicates) {
     Ptr<IAAFComponent2> component = Make<IAAFComponent2>(AUID_AAFFiller);
-    aafUInt32 count = 9;
     Ptr<IEnumAAFTaggedValues> all;
-    EXPECT_EQ(AAFRESULT_SUCCESS, component->CountComments(&count));
-    EXPECT_EQ(0u, count);
+    EXPECT_EQ(0u, Get(component, &IAAFComponent2::CountComments));
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, component->GetComments(all.Out()));
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, component->GetAttributes(all.Out()));
     for (int time = 0; time < 2; ++time) {
@@ -88,10 +84,8 @@ TEST_F(Component, KeepsCommentsAndAttributesWithTheirDuplicates) {
     }
     EXPECT_EQ(AAFRESULT_NULL_PARAM, component->AppendComment(nullptr, L"v"));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, component->AppendAttribute(L"n", nullptr));
-    EXPECT_EQ(AAFRESULT_SUCCESS, component->CountComments(&count));
-    EXPECT_EQ(2u, count);
-    EXPECT_EQ(AAFRESULT_SUCCESS, component->CountAttributes(&count));
-    EXPECT_EQ(2u, count);
+    EXPECT_EQ(2u, Get(component, &IAAFComponent2::CountComments));
+    EXPECT_EQ(2u, Get(component, &IAAFComponent2::CountAttributes));
     Ptr<IAAFTaggedValue> value;
     ASSERT_EQ(AAFRESULT_SUCCESS, component->GetAttributes(all.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
@@ -122,11 +116,9 @@ TEST_F(Component, OfTimecodeBringsItsDataDefinitionAlong) {
     EXPECT_EQ(-7, found.startFrame);
     EXPECT_EQ(0, found.fps);
     Ptr<IAAFDataDef> dataDef;
-    aafLength_t length = 0;
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(timecode)->GetDataDef(dataDef.Out()));
     EXPECT_EQ(DataDef(kAAFDataDef_LegacyTimecode).get(), dataDef.get());
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(timecode)->GetLength(&length));
-    EXPECT_EQ(5, length);
+    EXPECT_EQ(5, Get(As<IAAFComponent>(timecode), &IAAFComponent::GetLength));
 }
 
 TEST_F(Component, OfTimecodeTellsTheTimecodeAtAnOffset) {
@@ -174,8 +166,7 @@ TEST_F(Component, OfASourceStoresReferencesAsTheyAreButForNilOnes) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, reference->SetChannelIDs(2, nullptr));
     EXPECT_EQ(AAFRESULT_SUCCESS, reference->SetChannelIDs(2, ids));
     EXPECT_EQ(AAFRESULT_SUCCESS, reference->SetMonoSourceSlotIDs(2, ids));
-    EXPECT_EQ(AAFRESULT_SUCCESS, reference->GetChannelIDsSize(&count));
-    EXPECT_EQ(2u, count);
+    EXPECT_EQ(2u, Get(reference, &IAAFSourceReference2::GetChannelIDsSize));
     EXPECT_EQ(AAFRESULT_SUCCESS, reference->GetChannelIDs(2, back));
     EXPECT_EQ(5u, back[1]);
     EXPECT_EQ(AAFRESULT_SUCCESS, reference->GetMonoSourceSlotIDs(2, back));
@@ -307,9 +298,7 @@ TEST_F(Sequence, GivesAndRemovesComponentsByPlace) {
     EXPECT_EQ(AAFRESULT_BADINDEX, sequence->RemoveComponentAt(3));
     EXPECT_EQ(AAFRESULT_SUCCESS, sequence->RemoveComponentAt(1));
     EXPECT_EQ(5, LengthOf(sequence));
-    aafUInt32 count = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, sequence->CountComponents(&count));
-    EXPECT_EQ(2u, count);
+    EXPECT_EQ(2u, Get(sequence, &IAAFSequence::CountComponents));
     ASSERT_EQ(AAFRESULT_SUCCESS, sequence->GetComponents(all.Out()));
     IAAFComponent* both[3] = {};
     aafUInt32 fetched = 0;
@@ -323,13 +312,10 @@ TEST_F(Sequence, GivesAndRemovesComponentsByPlace) {
 
 TEST_F(Component, OfOtherProgramsKeepsItsParts) {
     Ptr<IAAFOperationGroup> group = Make<IAAFOperationGroup>(AUID_AAFOperationGroup);
-    aafUInt32 count = 9;
     EXPECT_EQ(AAFRESULT_SUCCESS, group->AppendInputSegment(As<IAAFSegment>(Clip(1))));
-    EXPECT_EQ(AAFRESULT_SUCCESS, group->CountSourceSegments(&count));
-    EXPECT_EQ(1u, count);
+    EXPECT_EQ(1u, Get(group, &IAAFOperationGroup::CountSourceSegments));
     EXPECT_EQ(AAFRESULT_SUCCESS, group->AddParameter(Make<IAAFParameter>(AUID_AAFConstantValue)));
-    EXPECT_EQ(AAFRESULT_SUCCESS, group->CountParameters(&count));
-    EXPECT_EQ(1u, count);
+    EXPECT_EQ(1u, Get(group, &IAAFOperationGroup::CountParameters));
     aafBoolean_t warp = kAAFFalse;
     EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED, group->IsATimeWarp(&warp));
 
@@ -342,16 +328,12 @@ TEST_F(Component, OfOtherProgramsKeepsItsParts) {
     Ptr<IAAFSelector> selector = Make<IAAFSelector>(AUID_AAFSelector);
     EXPECT_EQ(AAFRESULT_SUCCESS, selector->SetSelectedSegment(As<IAAFSegment>(Clip(1))));
     EXPECT_EQ(AAFRESULT_SUCCESS, selector->AppendAlternateSegment(As<IAAFSegment>(Clip(1))));
-    aafInt32 alternates = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, selector->GetNumAlternateSegments(&alternates));
-    EXPECT_EQ(1, alternates);
+    EXPECT_EQ(1, Get(selector, &IAAFSelector::GetNumAlternateSegments));
 
     Ptr<IAAFPulldown> pulldown = Make<IAAFPulldown>(AUID_AAFPulldown);
-    aafPulldownKind_t kind = 0;
     EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, pulldown->SetPulldownKind(8));
     EXPECT_EQ(AAFRESULT_SUCCESS, pulldown->SetPulldownKind(kAAFTwoToOnePD));
-    EXPECT_EQ(AAFRESULT_SUCCESS, pulldown->GetPulldownKind(&kind));
-    EXPECT_EQ(kAAFTwoToOnePD, kind);
+    EXPECT_EQ(kAAFTwoToOnePD, Get(pulldown, &IAAFPulldown::GetPulldownKind));
 }
 
 }  // namespace aaf_test

@@ -96,19 +96,16 @@ TEST(Exports, HaveNoPlugInsToManage) {
 TEST(Exports, ListTheKindsOfFilesThatCanBeWritten) {
     Ptr<IEnumAAFFileEncodings> all;
     Ptr<IAAFFileEncoding> encoding;
-    aafUID_t kind{};
     EXPECT_EQ(AAFRESULT_NULL_PARAM, AAFGetFileEncodings(nullptr));
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFGetFileEncodings(all.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(encoding.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, encoding->GetFileKind(&kind));
-    EXPECT_EQ(kAAFFileKind_Aaf512Binary, kind);
+    EXPECT_EQ(kAAFFileKind_Aaf512Binary, Get(encoding, &IAAFFileEncoding::GetFileKind));
     EXPECT_EQ(L"AAF-512", TextOf<IAAFFileEncoding>(encoding, &IAAFFileEncoding::GetNameBufLen,
                                                    &IAAFFileEncoding::GetName));
     EXPECT_NE(L"", TextOf<IAAFFileEncoding>(encoding, &IAAFFileEncoding::GetDescriptionBufLen,
                                             &IAAFFileEncoding::GetDescription));
     ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(encoding.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, encoding->GetFileKind(&kind));
-    EXPECT_EQ(kAAFFileKind_Aaf4KBinary, kind);
+    EXPECT_EQ(kAAFFileKind_Aaf4KBinary, Get(encoding, &IAAFFileEncoding::GetFileKind));
     EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->NextOne(encoding.Out()));
 }
 

@@ -56,9 +56,7 @@ TEST_F(File, CanBeClosedOnceAndStaysClosed) {
 }
 
 TEST_F(File, HasTheSecondRevision) {
-    aafFileRev_t revision = 7;
-    EXPECT_EQ(AAFRESULT_SUCCESS, file_->GetRevision(&revision));
-    EXPECT_EQ(kAAFRev2, revision);
+    EXPECT_EQ(kAAFRev2, Get(file_, &IAAFFile::GetRevision));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, file_->GetRevision(nullptr));
 }
 
@@ -96,9 +94,7 @@ TEST_F(File, LeavesAMobUsableThatOutlivesEverythingElse) {
     file_.Reset();
 
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L"alone"));
-    aafUInt32 slots = 7;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&slots));
-    EXPECT_EQ(0u, slots);
+    EXPECT_EQ(0u, Get(mob, &IAAFMob::CountSlots));
     Ptr<IAAFDictionary> dictionary;
     Ptr<IAAFDataDef> picture;
     ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(mob)->GetDictionary(dictionary.Out()));

@@ -25,11 +25,9 @@ std::vector<aafUInt8> Order(IEnumAAFMobs* mobs) {
 }  // namespace
 
 TEST_F(Header, OfANewFileHasOneIdentificationAndTheVersionsOfTheModel) {
-    aafUInt32 count = 0;
     aafVersionType_t revision{};
     aafProductVersion_t library{};
-    EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountIdentifications(&count));
-    EXPECT_EQ(1u, count);
+    EXPECT_EQ(1u, Get(header_, &IAAFHeader::CountIdentifications));
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->GetFileRevision(&revision));
     EXPECT_EQ(1, revision.major);
     EXPECT_EQ(1, revision.minor);
@@ -319,9 +317,7 @@ TEST_F(Header, KeepsEssenceUnderTheIdOfItsFileMob) {
     EXPECT_EQ(2, back[0]);
     EXPECT_EQ(AAFRESULT_END_OF_DATA, data->Read(4, back, &count));
     EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, data->SetPosition(4));
-    aafLength_t size = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, data->GetSize(&size));
-    EXPECT_EQ(3, size);
+    EXPECT_EQ(3, Get(data, &IAAFEssenceData::GetSize));
 
     aafBoolean_t present = kAAFFalse;
     Ptr<IAAFEssenceData> found;

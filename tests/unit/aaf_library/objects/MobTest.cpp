@@ -45,8 +45,7 @@ TEST_F(Mob, StartsWithTheTimeOfDayAndWithoutNameOrSlots) {
     wchar_t name[8] = L"";
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetName(name, sizeof name));
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetNameBufLen(&length));
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&length));
-    EXPECT_EQ(0u, length);
+    EXPECT_EQ(0u, Get(mob, &IAAFMob::CountSlots));
 }
 
 TEST_F(Mob, HasOneReferenceAndOneIdentity) {
@@ -72,9 +71,7 @@ TEST_F(Mob, TakesAnyNameButNone) {
     Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->SetName(nullptr));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L""));
-    aafUInt32 bytes = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetNameBufLen(&bytes));
-    EXPECT_EQ(sizeof(aafCharacter), bytes);
+    EXPECT_EQ(sizeof(aafCharacter), Get(mob, &IAAFMob::GetNameBufLen));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L"\x00E4 \x20AC"));
     EXPECT_EQ(L"\x00E4 \x20AC", TextOf<IAAFMob>(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
     wchar_t small[2];
@@ -134,24 +131,18 @@ TEST_F(Mob, AppendsTimelineSlots) {
     ASSERT_EQ(AAFRESULT_SUCCESS,
               mob->AppendNewTimelineSlot({1, 0}, segment, 0, L"name", -3, slot.Out()));
     EXPECT_EQ(2u, ReferencesOf(slot.get()));
-    aafPosition_t origin = 0;
     aafRational_t rate{};
-    aafSlotID_t id = 9;
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetOrigin(&origin));
-    EXPECT_EQ(-3, origin);
+    EXPECT_EQ(-3, Get(slot, &IAAFTimelineMobSlot::GetOrigin));
     EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetEditRate(&rate));
     EXPECT_EQ(1, rate.numerator);
     EXPECT_EQ(0, rate.denominator);
     Ptr<IAAFMobSlot> plain = As<IAAFMobSlot>(slot);
-    EXPECT_EQ(AAFRESULT_SUCCESS, plain->GetSlotID(&id));
-    EXPECT_EQ(0u, id);
+    EXPECT_EQ(0u, Get(plain, &IAAFMobSlot::GetSlotID));
     EXPECT_EQ(L"name",
               TextOf<IAAFMobSlot>(plain, &IAAFMobSlot::GetNameBufLen, &IAAFMobSlot::GetName));
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED,
               mob->AppendNewTimelineSlot({25, 1}, segment, 2, L"b", 0, slot.Out()));
-    aafUInt32 count = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&count));
-    EXPECT_EQ(1u, count);
+    EXPECT_EQ(1u, Get(mob, &IAAFMob::CountSlots));
 }
 
 TEST_F(Mob, AppendsStaticAndEventSlots) {
@@ -162,9 +153,7 @@ TEST_F(Mob, AppendsStaticAndEventSlots) {
               mob->AppendNewStaticSlot(As<IAAFSegment>(Clip(5)), 1, L"still", fixed.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendNewEventSlot({25, 1}, As<IAAFSegment>(Clip(5)), 2,
                                                          L"events", 7, events.Out()));
-    aafPosition_t origin = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFEventMobSlot2>(events)->GetEventSlotOrigin(&origin));
-    EXPECT_EQ(7, origin);
+    EXPECT_EQ(7, Get(As<IAAFEventMobSlot2>(events), &IAAFEventMobSlot2::GetEventSlotOrigin));
     aafRational_t rate{};
     EXPECT_EQ(AAFRESULT_SUCCESS, events->GetEditRate(&rate));
     EXPECT_EQ(25, rate.numerator);
@@ -319,9 +308,7 @@ TEST_F(Mob, KeepsEveryCommentInOrderAlsoUnderOneName) {
                      {L"Audio Format", L"AAC"},
                      {L"", L""}}),
               Comments(mob));
-    aafUInt32 count = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountComments(&count));
-    EXPECT_EQ(4u, count);
+    EXPECT_EQ(4u, Get(mob, &IAAFMob::CountComments));
 }
 
 TEST_F(Mob, StoresACommentAsATextWithItsEnd) {
@@ -334,9 +321,7 @@ TEST_F(Mob, StoresACommentAsATextWithItsEnd) {
     Ptr<IAAFTypeDef> text;
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetComments(all.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
-    aafUInt32 bytes = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, value->GetValueBufLen(&bytes));
-    EXPECT_EQ(4 * sizeof(aafCharacter), bytes);
+    EXPECT_EQ(4 * sizeof(aafCharacter), Get(value, &IAAFTaggedValue::GetValueBufLen));
     EXPECT_EQ(AAFRESULT_SUCCESS, value->GetTypeDefinition(type.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(kAAFTypeID_String, text.Out()));
     EXPECT_EQ(text.get(), type.get());
@@ -355,9 +340,7 @@ TEST_F(Mob, RemovesComments) {
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetComments(all.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->RemoveComment(value));
-    aafUInt32 count = 9;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountComments(&count));
-    EXPECT_EQ(0u, count);
+    EXPECT_EQ(0u, Get(mob, &IAAFMob::CountComments));
 }
 
 TEST_F(Mob, KeepsAttributesAndRawData) {
@@ -368,17 +351,14 @@ TEST_F(Mob, KeepsAttributesAndRawData) {
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, mob->GetKLVData(raw.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendAttribute(L"a", L"1"));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendAttribute(L"a", L"1"));
-    aafUInt32 count = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountAttributes(&count));
-    EXPECT_EQ(2u, count);
+    EXPECT_EQ(2u, Get(mob, &IAAFMob2::CountAttributes));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetAttributes(attributes.Out()));
 
     Ptr<IAAFKLVData> data = Make<IAAFKLVData>(AUID_AAFKLVData);
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->AppendKLVData(nullptr));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->AppendKLVData(data));
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, mob->AppendKLVData(data));
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountKLVData(&count));
-    EXPECT_EQ(1u, count);
+    EXPECT_EQ(1u, Get(mob, &IAAFMob2::CountKLVData));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->RemoveKLVData(data));
 }
 
@@ -409,13 +389,11 @@ TEST_F(Mob, CopiesItselfIntoItsFileUnderAFreshId) {
     Ptr<IAAFMob> copy;
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->Copy(L"twin", copy.Out()));
     aafMobID_t id{};
-    aafUInt32 slots = 0;
     aafNumSlots_t mobs = 0;
     EXPECT_EQ(AAFRESULT_SUCCESS, copy->GetMobID(&id));
     EXPECT_FALSE(SameMobId(MobId(1), id));
     EXPECT_EQ(L"twin", TextOf<IAAFMob>(copy, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
-    EXPECT_EQ(AAFRESULT_SUCCESS, copy->CountSlots(&slots));
-    EXPECT_EQ(1u, slots);
+    EXPECT_EQ(1u, Get(copy, &IAAFMob::CountSlots));
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFFileMob, &mobs));
     EXPECT_EQ(2u, mobs);
 }

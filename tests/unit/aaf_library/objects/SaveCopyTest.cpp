@@ -68,11 +68,8 @@ TEST_F(SaveCopy, WritesAFileThatReadsBackWhole) {
     EXPECT_EQ(L"A001", TextOf<IAAFMob>(master, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
     EXPECT_EQ(Comments(master_), Comments(master));
 
-    aafUInt32 count = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, source->CountSlots(&count));
-    EXPECT_EQ(5u, count);
-    EXPECT_EQ(AAFRESULT_SUCCESS, fileMob->CountSlots(&count));
-    EXPECT_EQ(3u, count);
+    EXPECT_EQ(5u, Get(source, &IAAFMob::CountSlots));
+    EXPECT_EQ(3u, Get(fileMob, &IAAFMob::CountSlots));
 
     Ptr<IAAFMobSlot> slot;
     Ptr<IAAFSegment> segment;
@@ -94,9 +91,7 @@ TEST_F(SaveCopy, WritesAFileThatReadsBackWhole) {
     Ptr<IAAFLocator> locator;
     ASSERT_EQ(AAFRESULT_SUCCESS, multiple->GetFileDescriptorAt(0, part.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, part->GetContainerFormat(container.Out()));
-    aafInt32 width = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFCDCIDescriptor>(part)->GetComponentWidth(&width));
-    EXPECT_EQ(10, width);
+    EXPECT_EQ(10, Get(As<IAAFCDCIDescriptor>(part), &IAAFCDCIDescriptor::GetComponentWidth));
     ASSERT_EQ(AAFRESULT_SUCCESS, essence->GetLocatorAt(0, locator.Out()));
     EXPECT_EQ(L"file:///media/A001.mov",
               TextOf<IAAFLocator>(locator, &IAAFLocator::GetPathBufLen, &IAAFLocator::GetPath));
@@ -138,9 +133,7 @@ TEST_F(SaveCopy, CarriesExtensionsThatNothingUses) {
     ASSERT_EQ(AAFRESULT_SUCCESS, target->GetDictionary(dictionary.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->LookupClassDef(AUID_AAFMob, mobs.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, mobs->LookupPropertyDef(id, property.Out()));
-    aafBoolean_t optional = kAAFFalse;
-    EXPECT_EQ(AAFRESULT_SUCCESS, property->GetIsOptional(&optional));
-    EXPECT_EQ(kAAFTrue, optional);
+    EXPECT_EQ(kAAFTrue, Get(property, &IAAFPropertyDef::GetIsOptional));
 }
 
 TEST_F(SaveCopy, GivesEqualFilesOfEqualClipsWhileTimeIsPinned) {
@@ -244,11 +237,9 @@ TEST_F(SaveCopy, ChangesAnExistingFileAndSaysWho) {
     Ptr<IAAFFile> file;
     Ptr<IAAFHeader> header;
     Ptr<IAAFMob> mob;
-    aafUInt32 count = 0;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, file.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, header->CountIdentifications(&count));
-    EXPECT_EQ(2u, count);
+    EXPECT_EQ(2u, Get(header, &IAAFHeader::CountIdentifications));
     ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(1), mob.Out()));
     EXPECT_EQ(L"changed", TextOf<IAAFMob>(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
 }
@@ -304,12 +295,10 @@ TEST_F(SaveCopy, CarriesEssence) {
     Copy(path);
     Ptr<IAAFFile> read;
     Ptr<IAAFHeader> header;
-    aafLength_t size = 0;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, read.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, read->GetHeader(header.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupEssenceData(MobId(1), data.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, data->GetSize(&size));
-    EXPECT_EQ(100000, size);
+    EXPECT_EQ(100000, Get(data, &IAAFEssenceData::GetSize));
 }
 
 }  // namespace aaf_test

@@ -25,20 +25,16 @@ std::wstring NameOf(IAAFMobSlot* slot) {
 TEST_F(Slot, StartsWithoutNameNumberAndSegment) {
     Ptr<IAAFTimelineMobSlot> timeline = Make<IAAFTimelineMobSlot>(AUID_AAFTimelineMobSlot);
     Ptr<IAAFMobSlot> slot = As<IAAFMobSlot>(timeline);
-    aafSlotID_t id = 9;
     aafUInt32 number = 9;
-    aafPosition_t origin = 9;
     aafRational_t rate{9, 9};
     wchar_t name[4];
     Ptr<IAAFSegment> segment;
     Ptr<IAAFDataDef> dataDef;
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetSlotID(&id));
-    EXPECT_EQ(0u, id);
+    EXPECT_EQ(0u, Get(slot, &IAAFMobSlot::GetSlotID));
     EXPECT_EQ(AAFRESULT_SUCCESS, timeline->GetEditRate(&rate));
     EXPECT_EQ(0, rate.numerator);
     EXPECT_EQ(0, rate.denominator);
-    EXPECT_EQ(AAFRESULT_SUCCESS, timeline->GetOrigin(&origin));
-    EXPECT_EQ(0, origin);
+    EXPECT_EQ(0, Get(timeline, &IAAFTimelineMobSlot::GetOrigin));
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, slot->GetName(name, sizeof name));
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, slot->GetPhysicalNum(&number));
     EXPECT_EQ(AAFRESULT_NULLOBJECT, slot->GetSegment(segment.Out()));
@@ -47,10 +43,8 @@ TEST_F(Slot, StartsWithoutNameNumberAndSegment) {
 
 TEST_F(Slot, TakesAnyPhysicalNumberAndName) {
     Ptr<IAAFMobSlot> slot = Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot);
-    aafUInt32 number = 0;
     EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetPhysicalNum(0xFFFFFFFF));
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetPhysicalNum(&number));
-    EXPECT_EQ(0xFFFFFFFFu, number);
+    EXPECT_EQ(0xFFFFFFFFu, Get(slot, &IAAFMobSlot::GetPhysicalNum));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, slot->SetName(nullptr));
     EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetName(L""));
     EXPECT_EQ(L"", NameOf(slot));
@@ -86,12 +80,9 @@ TEST_F(Slot, HasMarksThatAreAbsentAtFirst) {
     EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetMarkIn(-1));
     EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetMarkOut(2));
     EXPECT_EQ(AAFRESULT_SUCCESS, slot->SetUserPos(3));
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetMarkIn(&at));
-    EXPECT_EQ(-1, at);
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetMarkOut(&at));
-    EXPECT_EQ(2, at);
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetUserPos(&at));
-    EXPECT_EQ(3, at);
+    EXPECT_EQ(-1, Get(slot, &IAAFTimelineMobSlot2::GetMarkIn));
+    EXPECT_EQ(2, Get(slot, &IAAFTimelineMobSlot2::GetMarkOut));
+    EXPECT_EQ(3, Get(slot, &IAAFTimelineMobSlot2::GetUserPos));
 }
 
 TEST_F(SourceMob, HasNoDescriptorAtFirst) {
@@ -126,17 +117,13 @@ TEST_F(SourceMob, AppendsNilReferencesAlsoUnderOneId) {
     EXPECT_EQ(AAFRESULT_BADRATE, source->AddNilReference(1, 5, sound, {25, 0}));
     EXPECT_EQ(AAFRESULT_SUCCESS, source->AddNilReference(1, 12960000, sound, {25, 1}));
     EXPECT_EQ(AAFRESULT_SUCCESS, source->AddNilReference(1, -5, sound, {25, 1}));
-    aafUInt32 count = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&count));
-    EXPECT_EQ(2u, count);
+    EXPECT_EQ(2u, Get(mob, &IAAFMob::CountSlots));
 
     Ptr<IAAFMobSlot> slot;
     Ptr<IAAFSegment> segment;
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(1, slot.Out()));
     EXPECT_EQ(L"Test", NameOf(slot));
-    aafPosition_t origin = 9;
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTimelineMobSlot>(slot)->GetOrigin(&origin));
-    EXPECT_EQ(0, origin);
+    EXPECT_EQ(0, Get(As<IAAFTimelineMobSlot>(slot), &IAAFTimelineMobSlot::GetOrigin));
     ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
     aafSourceRef_t reference{MobId(1), 1, 1};
     aafLength_t length = 0;
@@ -144,8 +131,7 @@ TEST_F(SourceMob, AppendsNilReferencesAlsoUnderOneId) {
     EXPECT_TRUE(SameMobId(aafMobID_t{}, reference.sourceID));
     EXPECT_EQ(0u, reference.sourceSlotID);
     EXPECT_EQ(0, reference.startTime);
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
-    EXPECT_EQ(12960000, length);
+    EXPECT_EQ(12960000, Get(As<IAAFComponent>(segment), &IAAFComponent::GetLength));
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetSlotAt(1, slot.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, As<IAAFComponent>(segment)->GetLength(&length));
@@ -165,18 +151,14 @@ TEST_F(SourceMob, PutsNewReferencesIntoSlotsOldOrNew) {
     slot->SetName(L"mine");
 
     EXPECT_EQ(AAFRESULT_SUCCESS, source->NewPhysSourceRef({25, 1}, 7, picture, reference, 20));
-    aafUInt32 count = 0;
     aafRational_t rate{};
-    aafLength_t length = 0;
     Ptr<IAAFSegment> segment;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->CountSlots(&count));
-    EXPECT_EQ(1u, count);
+    EXPECT_EQ(1u, Get(mob, &IAAFMob::CountSlots));
     EXPECT_EQ(L"mine", NameOf(slot));
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTimelineMobSlot>(slot)->GetEditRate(&rate));
     EXPECT_EQ(30, rate.numerator);
     ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
-    EXPECT_EQ(20, length);
+    EXPECT_EQ(20, Get(As<IAAFComponent>(segment), &IAAFComponent::GetLength));
     aafSourceRef_t found{};
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&found));
     EXPECT_TRUE(SameMobId(MobId(3), found.sourceID));
@@ -208,9 +190,7 @@ TEST_F(SourceMob, AppendsToSequencesOnly) {
                                                             L"", 0, slot.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS,
               source->AppendPhysSourceRef({25, 1}, 2, picture, aafSourceRef_t{}, 10));
-    aafUInt32 count = 0;
-    EXPECT_EQ(AAFRESULT_SUCCESS, sequence->CountComponents(&count));
-    EXPECT_EQ(1u, count);
+    EXPECT_EQ(1u, Get(sequence, &IAAFSequence::CountComponents));
 }
 
 TEST_F(SourceMob, AppendsSlotsOfTimecodeAndEdgecode) {

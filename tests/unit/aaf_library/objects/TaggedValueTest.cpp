@@ -92,16 +92,13 @@ TEST_F(TaggedValue, OfRawDataKeepsKeyAndBytes) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, data->Initialize(key, 3, nullptr));
     ASSERT_EQ(AAFRESULT_SUCCESS, data->Initialize(key, 3, bytes));
     EXPECT_EQ(AAFRESULT_ALREADY_INITIALIZED, data->Initialize(key, 3, bytes));
-    EXPECT_EQ(AAFRESULT_SUCCESS, data->GetKey(&found));
-    EXPECT_EQ(key, found);
-    EXPECT_EQ(AAFRESULT_SUCCESS, data->GetValueBufLen(&size));
-    EXPECT_EQ(3u, size);
+    EXPECT_EQ(key, Get(data, &IAAFKLVData::GetKey));
+    EXPECT_EQ(3u, Get(data, &IAAFKLVData::GetValueBufLen));
     EXPECT_EQ(AAFRESULT_SMALLBUF, data->GetValue(2, back, &size));
     EXPECT_EQ(AAFRESULT_SUCCESS, data->GetValue(3, back, &size));
     EXPECT_EQ(3, back[2]);
     EXPECT_EQ(AAFRESULT_SUCCESS, data->SetValue(1, bytes));
-    EXPECT_EQ(AAFRESULT_SUCCESS, data->GetValueBufLen(&size));
-    EXPECT_EQ(1u, size);
+    EXPECT_EQ(1u, Get(data, &IAAFKLVData::GetValueBufLen));
 }
 
 }  // namespace aaf_test

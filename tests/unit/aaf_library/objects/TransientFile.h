@@ -15,6 +15,7 @@
 #include "host_interfaces/aaf/AAFExports.h"
 #include "host_interfaces/aaf/AAFResultCodes.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
+#include "tests/unit/aaf_library/Get.h"
 
 // The library's functions, linked by name.
 extern "C" {

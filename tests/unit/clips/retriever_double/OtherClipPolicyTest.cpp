@@ -21,7 +21,7 @@ protected:
     }
     // A refusal tells its reason to the log, and a line of its own to the user.
     void ExpectRefusal(const std::string& reason, const std::string& line) {
-        EXPECT_EQ(log->count("OtherClip::IsVideoSampleProviderMedia" + reason), 1) << reason;
+        EXPECT_TRUE(log->once("OtherClip::IsVideoSampleProviderMedia" + reason)) << reason;
         EXPECT_EQ(Console(2, line), 1) << line;
         EXPECT_EQ(host->console().lines().size(), 1u) << reason;
         EXPECT_FALSE(retriever.asked) << reason;
@@ -70,7 +70,7 @@ TEST_F(OtherClipPolicy, ProvidesSilentlyWhatTheRetrieverDoesNotKnow) {
 TEST_F(OtherClipPolicy, ProvidesMoviesWithExternalMediaAtTheFirstCheck) {
     wrapper->selfContained = 0;
     EXPECT_EQ(other->IsVideoSampleProviderMedia(&info), 0);
-    EXPECT_EQ(log->count("BaseClip::CommonSampleProviderCheckThe movie is not self contained."), 1);
+    EXPECT_TRUE(log->once("BaseClip::CommonSampleProviderCheckThe movie is not self contained."));
     EXPECT_EQ(Console(2, "The movie is not self contained."), 1);
     EXPECT_EQ(journal.count("wrapper.MovieHasMultipleVideoTracks"), 0);
 }
@@ -170,8 +170,7 @@ TEST_F(OtherClipPolicy, IsNativeForPlainLinearSound) {
 TEST_F(OtherClipPolicy, ProvidesSoundOfAnotherLengthThanTheMovie) {
     wrapper->soundIssue = 1;
     EXPECT_EQ(other->IsAudioSampleProviderMedia(2, &samples), 0);
-    EXPECT_EQ(log->count("OtherClip::IsAudioSampleProviderMediaMovieTrackDurationIssues found."),
-              1);
+    EXPECT_TRUE(log->once("OtherClip::IsAudioSampleProviderMediaMovieTrackDurationIssues found."));
     EXPECT_EQ(Console(2, "MovieTrackDurationIssues found.\n"), 1);
 }
 

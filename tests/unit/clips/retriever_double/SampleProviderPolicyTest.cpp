@@ -25,7 +25,7 @@ protected:
     // A refusal tells its reason twice.
     void ExpectReason(const std::string& function, const std::string& reason) {
         EXPECT_EQ(Console(2, reason), 1) << reason;
-        EXPECT_EQ(log->count(function + reason), 1) << reason;
+        EXPECT_TRUE(log->once(function + reason)) << reason;
     }
     SampleProviderRule Rule() { return SampleProviderRule(TheConsole()); }
     NCFSmartPtr<INCFConsole> TheConsole() { return NCFSmartPtr<INCFConsole>(&host->console()); }
@@ -134,15 +134,13 @@ TEST_F(SampleProviderPolicy, LooksAtThePictureInOneOrder) {
 TEST_F(SampleProviderPolicy, HandsFailuresAboutThePictureOn) {
     Video().results["GetSampleDescriptionCount"] = NCF_E_ABORT;
     EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), NCF_E_ABORT);
-    EXPECT_EQ(log->count(ReturnRecord("80000007", "vti->GetSampleDescriptionCount(&descCount)",
-                                      "QuickTimeClip::IsVideoSampleProviderMedia")),
-              1);
+    EXPECT_TRUE(log->returned("80000007", "vti->GetSampleDescriptionCount(&descCount)",
+                              "QuickTimeClip::IsVideoSampleProviderMedia"));
     Video().results.clear();
     parser->results["GetVideoTrackCount"] = NCF_E_FAIL;
     EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), NCF_E_FAIL);
-    EXPECT_EQ(log->count(ReturnRecord("80000008", "qtParser_->GetVideoTrackCount(&trackCount)",
-                                      "QuickTimeClip::IsVideoSampleProviderMedia")),
-              1);
+    EXPECT_TRUE(log->returned("80000008", "qtParser_->GetVideoTrackCount(&trackCount)",
+                              "QuickTimeClip::IsVideoSampleProviderMedia"));
 }
 
 TEST_F(SampleProviderPolicy, HasNoAnswerAboutThePictureOfASoundOnlyMovie) {
@@ -150,7 +148,7 @@ TEST_F(SampleProviderPolicy, HasNoAnswerAboutThePictureOfASoundOnlyMovie) {
     parser->videoTracks.clear();
     Load();
     EXPECT_EQ(clip->IsVideoSampleProviderMedia(&info), NCF_E_POINTER);
-    EXPECT_EQ(log->count("CHK_PTR(vti.inArg())QuickTimeClip::IsVideoSampleProviderMedia"), 1);
+    EXPECT_TRUE(log->once("CHK_PTR(vti.inArg())QuickTimeClip::IsVideoSampleProviderMedia"));
 }
 
 // --- sound ---------------------------------------------------------------------------------
@@ -261,15 +259,14 @@ TEST_F(SampleProviderPolicy, HandsFailuresAboutSoundOn) {
         step.calls->results[step.operation] = NCF_E_ABORT;
         log->clear();
         EXPECT_EQ(clip->IsAudioSampleProviderMedia(2, &samples), NCF_E_ABORT) << step.operation;
-        EXPECT_EQ(log->count(std::string("NCF_RETURN(0x80000007): ") + step.record), 1)
+        EXPECT_TRUE(log->once(std::string("NCF_RETURN(0x80000007): ") + step.record))
             << step.operation;
         step.calls->results.clear();
     }
     EXPECT_EQ(clip->IsAudioSampleProviderMedia(99, &samples), NCF_E_NOTFOUND);
-    EXPECT_EQ(log->count(ReturnRecord(
-                  "8000000c", "BaseClip::IsAudioSampleProviderMedia(qtTrack, numAudioSamples)",
-                  "QuickTimeClip::IsAudioSampleProviderMedia")),
-              1);
+    EXPECT_TRUE(log->returned("8000000c",
+                              "BaseClip::IsAudioSampleProviderMedia(qtTrack, numAudioSamples)",
+                              "QuickTimeClip::IsAudioSampleProviderMedia"));
 }
 
 TEST_F(SampleProviderPolicy, KnowsLinearSoundByOneCode) {
@@ -291,9 +288,9 @@ TEST_F(SampleProviderPolicy, TellsTheUserOfAForcedPicture) {
     retriever.result = NCF_E_NOTSUPPORTED;
     EXPECT_EQ(MovieRequiresSampleProviderForVideo(TheConsole(), clip, &info), 0);
     EXPECT_EQ(Console(2, "Forcing sample provider mode for video.\n"), 1);
-    EXPECT_EQ(log->count("MovieRequiresSampleProviderForVideoForcing sample provider mode for "
-                         "video!"),
-              1);
+    EXPECT_TRUE(
+        log->once("MovieRequiresSampleProviderForVideoForcing sample provider mode for "
+                  "video!"));
 }
 
 TEST_F(SampleProviderPolicy, TellsTheUserOfForcedSound) {
@@ -302,9 +299,9 @@ TEST_F(SampleProviderPolicy, TellsTheUserOfForcedSound) {
     Sound().description->lpcm = 0;
     EXPECT_EQ(MovieRequiresSampleProviderForAudio(TheConsole(), clip, 2, &samples), 0);
     EXPECT_EQ(Console(2, "Forcing sample provider mode for audio track 2.\n"), 1);
-    EXPECT_EQ(log->count("MovieRequiresSampleProviderForAudioForcing sample provider mode for "
-                         "audio track: 2 is enabled!"),
-              1);
+    EXPECT_TRUE(
+        log->once("MovieRequiresSampleProviderForAudioForcing sample provider mode for "
+                  "audio track: 2 is enabled!"));
 }
 
 TEST_F(SampleProviderPolicy, TellsNothingOfFailures) {

@@ -82,8 +82,8 @@ TEST_F(Descriptions, OfAContainerComeFromTheContainerItself) {
     EXPECT_EQ(one, other);
     EXPECT_EQ(descriptionDouble.factory, host.factory());
     EXPECT_EQ(descriptionDouble.console, &host.console());
-    EXPECT_EQ(
-        log.count(std::string(kContainerFunction) + "NewAAFFromMovie completed successfully!"), 1);
+    EXPECT_TRUE(
+        log.once(std::string(kContainerFunction) + "NewAAFFromMovie completed successfully!"));
 
     IAAFFile* file = nullptr;
     EXPECT_EQ(references(made), 1u) << "the container's";
@@ -117,10 +117,10 @@ TEST_F(Descriptions, OfAContainerThatFailKeepTheFormerOne) {
     auto* none = reinterpret_cast<NMA::IAAFClips*>(&host);
     EXPECT_EQ(object->GetAAFMasterClips(&none), NCF_E_ABORT);
     EXPECT_EQ(none, nullptr);
-    EXPECT_EQ(log.count("NCF_RETURN(0x80000007): NewAAFFromMovie(media_, console_, &aafFile_, "
-                        "componentFactory_) : " +
-                        std::string(kContainerFunction)),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_RETURN(0x80000007): NewAAFFromMovie(media_, console_, &aafFile_, "
+                 "componentFactory_) : " +
+                 std::string(kContainerFunction)));
     IAAFFile* file = nullptr;
     EXPECT_EQ(clips->GetMetadata(0, &file), NCF_OK);
     EXPECT_EQ(file, made);
@@ -154,10 +154,10 @@ TEST_F(Descriptions, OfAContainerNeedALoadedClip) {
     RecordingLog log(host);
     NCFSmartPtr<NMA::IAAFClips> clips;
     EXPECT_EQ(container("b.mov")->GetAAFMasterClips(clips.outArg()), NMA_E_NOTINITIALIZED);
-    EXPECT_EQ(log.count("NCF_RETURN(0xa0000068): LoadMedia(filePath_, console_, "
-                        "componentFactory_, media_) : " +
-                        std::string(kContainerFunction)),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_RETURN(0xa0000068): LoadMedia(filePath_, console_, "
+                 "componentFactory_, media_) : " +
+                 std::string(kContainerFunction)));
     EXPECT_TRUE(descriptionDouble.clips.empty());
 }
 
@@ -175,10 +175,10 @@ TEST_F(Descriptions, OfAContainerWithoutTheInterfaceGiveTheRefusal) {
         RecordingLog log(host);
         NCFSmartPtr<NMA::IAAFClips> clips;
         EXPECT_EQ(object->GetAAFMasterClips(clips.outArg()), NCF_E_NOINTERFACE);
-        EXPECT_EQ(log.count("NCF_RETURN(0x80000004): QueryInterface(NMA::IID_IAAFClips, "
-                            "(void**)ppClips) : " +
-                            std::string(kContainerFunction)),
-                  1);
+        EXPECT_TRUE(
+            log.once("NCF_RETURN(0x80000004): QueryInterface(NMA::IID_IAAFClips, "
+                     "(void**)ppClips) : " +
+                     std::string(kContainerFunction)));
     }
     inner->Release();
     outer->Release();
@@ -207,10 +207,10 @@ TEST_F(Descriptions, OfAListThatFailGiveNothing) {
     auto* file = reinterpret_cast<IAAFFile*>(&host);
     EXPECT_EQ(clips->GetMetadata(0, &file), NCF_E_ABORT);
     EXPECT_EQ(file, nullptr);
-    EXPECT_EQ(log.count("NCF_RETURN(0x80000007): NewAAFFromMovie(media, _pConsole, ppData, "
-                        "_pComponentFactory) : " +
-                        std::string(kListFunction)),
-              1);
+    EXPECT_TRUE(
+        log.once("NCF_RETURN(0x80000007): NewAAFFromMovie(media, _pConsole, ppData, "
+                 "_pComponentFactory) : " +
+                 std::string(kListFunction)));
 }
 
 TEST_F(Descriptions, OfAListThatThrowAreGivenAsResults) {

@@ -243,9 +243,8 @@ TEST_F(AttributeTexts, BoxWithoutAPartFailsAndKeepsWhatWasRead) {
         RecordingLog log(host);
         BoundsBox box;
         EXPECT_EQ(parser.GetBox(kBoxFraming, &box), NCF_E_FAIL) << broken.removed;
-        EXPECT_EQ(log.count(std::string("NCFASSERT( ") + broken.logged +
-                            " )ParseHelperFunctions::QTAttributesXMLParser::GetBox"),
-                  1);
+        EXPECT_TRUE(log.once(std::string("NCFASSERT( ") + broken.logged +
+                             " )ParseHelperFunctions::QTAttributesXMLParser::GetBox"));
         EXPECT_EQ(box.positionX.numerator == -8, broken.horizontalStored);
         EXPECT_EQ(box.positionY.numerator == -9, broken.verticalStored);
         EXPECT_EQ(box.height.numerator == 18, broken.heightStored);
@@ -259,20 +258,20 @@ TEST_F(AttributeTexts, MissingNumeratorAndDenominatorAreLoggedUnderOneText) {
     QTAttributesXMLParser first = parse(
         "<Bounds><Valid><PositionX><Denominator>1</Denominator></PositionX></Valid></Bounds>");
     EXPECT_EQ(first.GetBox(kBoxValid, &box), NCF_E_FAIL);
-    EXPECT_EQ(log.count("NCFASSERT( numeratorElement )"
-                        "ParseHelperFunctions::QTAttributesXMLParser::_GetNumerator"),
-              1);
-    EXPECT_EQ(log.count("NCF_RETURN(0x80000008): "
-                        "_GetNumerator(positionXNode,&op_box->positionX.numerator) : "
-                        "ParseHelperFunctions::QTAttributesXMLParser::GetBox"),
-              1);
+    EXPECT_TRUE(
+        log.once("NCFASSERT( numeratorElement )"
+                 "ParseHelperFunctions::QTAttributesXMLParser::_GetNumerator"));
+    EXPECT_TRUE(
+        log.once("NCF_RETURN(0x80000008): "
+                 "_GetNumerator(positionXNode,&op_box->positionX.numerator) : "
+                 "ParseHelperFunctions::QTAttributesXMLParser::GetBox"));
     QTAttributesXMLParser second =
         parse("<Bounds><Valid><PositionX><Numerator>5</Numerator></PositionX></Valid></Bounds>");
     EXPECT_EQ(second.GetBox(kBoxValid, &box), NCF_E_FAIL);
     EXPECT_EQ(box.positionX.numerator, 5);
-    EXPECT_EQ(log.count("NCFASSERT( numeratorElement )"
-                        "ParseHelperFunctions::QTAttributesXMLParser::_GetDenominator"),
-              1);
+    EXPECT_TRUE(
+        log.once("NCFASSERT( numeratorElement )"
+                 "ParseHelperFunctions::QTAttributesXMLParser::_GetDenominator"));
 }
 
 TEST_F(AttributeTexts, NumberWithoutTextIsUnexpected) {

@@ -6,8 +6,8 @@
 #include <string>
 #include <vector>
 
-#include "source/clips/BaseClip.h"
 #include "tests/support/fakes/FakeHost.h"
+#include "tests/support/fakes/StubClip.h"
 #include "tests/support/fakes/parser/FakeCalls.h"
 
 // One track of a fake clip with its samples.
@@ -25,10 +25,10 @@ struct EssenceTrack {
 // A clip that answers what a test sets: writes "clip.<operation> <arguments>"
 // into the journal and fails the operations named in `results`, or single calls
 // of them.
-class EssenceClip final : public BaseClip, public FakeCalls {
+class EssenceClip final : public StubClip, public FakeCalls {
 public:
     EssenceClip(FakeHost& host, Journal* lines)
-        : BaseClip(Text("/movies/a.mov"), NCFSmartPtr<INCFConsole>(&host.console()),
+        : StubClip(Text("/movies/a.mov"), NCFSmartPtr<INCFConsole>(&host.console()),
                    NCFSmartPtr<INCFComponentFactory>(host.factory())),
           FakeCalls("clip", lines) {
         loaded_ = 1;
@@ -153,41 +153,6 @@ public:
     }
     NCFRESULT GetDecodeDuration(ncfUInt32 qtTrack, ncfUInt64 sample, ncfSInt64* out) override {
         return ask("GetDecodeDuration", qtTrack, sample, out, trackOf(qtTrack).duration);
-    }
-
-    // --- nobody here asks these --------------------------------------------------------
-    NCFRESULT GetNMAFrameLayout(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetDataFormat(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetVendor(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetNivoResolution(ncfUInt32*) const override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetTimecodeTrackQTId(ncfUInt32, ncfUInt32&) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetTimeCodeTrackMetadata(ncfUInt32, TimeCodeTrackMetadata*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT IsAudioLPCM(ncfUInt32, ncfBool*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetEditRate(Rational*) const override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetMovieLength(ncfUInt64*) const override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetCreationTime(ncfUInt64*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetCodecName(ncfUInt32, NCFSmartPtr<INCFString>&) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetContentForHash(std::vector<ncfUInt8>&) override { return NCF_E_NOTIMPL; }
-    NCFRESULT IsSelfContained() override { return NCF_E_NOTIMPL; }
-    NCFRESULT IsVideoSampleProviderMedia(AAFInfo*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetMaxDataSizeInBytes(ncfUInt32, ncfUInt32*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetHasOutOfOrderFrameDependencies(ncfUInt32, ncfBool*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT LoadClipImpl() override { return NCF_E_NOTIMPL; }
-    NCFRESULT SetColorSpaceImpl() override { return NCF_E_NOTIMPL; }
-    NCFRESULT SetGeometryImpl() override { return NCF_E_NOTIMPL; }
-    NCFRESULT SetEditRateImpl(const EditorSettings&) override { return NCF_E_NOTIMPL; }
-    NCFRESULT SetMovieLengthImpl(const EditorSettings&) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetEncodedWidthAndHeightImpl(ncfUInt32*, ncfUInt32*) override {
-        return NCF_E_NOTIMPL;
-    }
-    NCFRESULT GetImageAspectRatioImpl(ncfUInt32*, ncfUInt32*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetTimeCodeTrackCountImpl(ncfUInt32*) override { return NCF_E_NOTIMPL; }
-    NCFRESULT CalculateAudioTrackLengthInSamples(ncfUInt32, ncfUInt64*) override {
-        return NCF_E_NOTIMPL;
     }
 
 private:

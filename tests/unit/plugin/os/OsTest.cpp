@@ -250,7 +250,7 @@ TEST_F(OperatingSystem, FindsTheModuleThatHoldsAnAddress) {
     std::wstring path;
     ASSERT_TRUE(os::GetModulePath(reinterpret_cast<const void*>(&os::LastError), &path));
     EXPECT_EQ(path.front(), L'/');
-    EXPECT_NE(path.find(L"test_plugin"), std::wstring::npos);
+    EXPECT_TRUE(std::filesystem::equivalent(path, "/proc/self/exe")) << "the program itself";
     EXPECT_FALSE(os::GetModulePath(nullptr, &path));
 }
 

@@ -4,8 +4,7 @@
 
 #include "host_interfaces/aaf/AAF.h"
 
-// Ids of the published interfaces and how many operations each has after the
-// three of the root.
+// Ids of the published interfaces.
 namespace {
 
 struct Row {

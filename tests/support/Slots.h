@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <gtest/gtest.h>
+
 #include <cstddef>
 #include <cstring>
 
@@ -16,8 +18,17 @@ std::size_t SlotOf(Operation operation) {
     return (words[0] - 1) / sizeof(void*);
 }
 
+// An operation and its place, written down once more: modules that are built call
+// by place.
 struct SlotRow {
     const char* operation;
     std::size_t published;
     std::size_t declared;
 };
+
+template <std::size_t count>
+void ExpectPublishedPlaces(const SlotRow (&rows)[count]) {
+    for (const SlotRow& row : rows) {
+        EXPECT_EQ(row.declared, row.published) << row.operation;
+    }
+}

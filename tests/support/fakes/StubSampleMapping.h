@@ -3,16 +3,11 @@
 #pragma once
 
 #include "host_interfaces/media/SampleMapping.h"
+#include "tests/support/fakes/FakeObject.h"
 
-namespace cliphost_tests {
-
-// A sample mapping that answers nothing but what a test overrides. It counts no
-// references.
-class StubSampleMap : public NMA::ISampleMapping {
+// A sample mapping of one track that answers nothing but what a test overrides.
+class StubSampleMapping : public FakeObject<NMA::ISampleMapping> {
 public:
-    NCFRESULT QueryInterface(const GUID&, void**) override { return NCF_E_NOINTERFACE; }
-    ncfUInt32 AddRef() override { return 1; }
-    ncfUInt32 Release() override { return 1; }
     ncfSInt32 GetNumberOfTracks() override { return 1; }
     NCFRESULT GetNumberOfChannels(ncfUInt32, ncfUInt32*) override { return kNo; }
     NCFRESULT GetNumberOfSamples(ncfUInt32, ncfUInt64*) override { return kNo; }
@@ -49,5 +44,3 @@ public:
 private:
     static constexpr NCFRESULT kNo = NCF_E_NOTIMPL;
 };
-
-}  // namespace cliphost_tests
