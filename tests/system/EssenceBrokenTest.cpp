@@ -250,7 +250,7 @@ TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
                   .status,
               0);
     ExpectSays(RunCliphost("audio " + Quoted(Cut(whole, 0.4)) + " --rate 48000 -o " + Quoted(wav)),
-               1, "which could not be read");
+               1, "could not be read and are silent");
     EXPECT_EQ(Decoded(wav, "-f s24le -c:a pcm_s24le").size(), 192000u * 3);
 }
 

@@ -26,7 +26,7 @@ protected:
 
 TEST_F(EssenceProgram, ShowsTheSampleMapAsTextAndJson) {
     const auto movie = Quoted(MadeMovie("h264_with_aac.mov"));
-    ExpectSays(RunCliphost("samples " + movie), 0, "all of it lies inside the file");
+    ExpectSays(RunCliphost("samples " + movie), 0, "all samples lie inside the file");
     const CommandResult result = RunCliphost("samples --json " + movie);
     ASSERT_EQ(result.status, 0) << result.out;
     const Json json = Json::parse(result.out);

@@ -77,7 +77,7 @@ TEST_F(ExitStatus, IsTheSameForAMovieOutOfAFolder) {
     std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "in/good.mov");
     Write(movies::Bytes(100, 'x'), "in/text.mov");
     EXPECT_EQ(RunCliphost("describe -q " + In("in")).status, 1);
-    ExpectSays(RunCliphost("--help"), 0, "Exit status: 0, all is done; 1, ");
+    ExpectSays(RunCliphost("--help"), 0, "Exit status: 0, everything was done; 1, ");
 }
 
 // The edits leave fewer pictures than the movie's length says.
