@@ -268,8 +268,13 @@ struct LevelsCase {
     const char* name;
     const char* record;  // none for the sample provider
     int refBlack, refWhite;
-    std::string black, white;
+    const char* black;
+    const char* white;
 };
+
+void PrintTo(const LevelsCase& given, std::ostream* to) {
+    *to << given.name;
+}
 
 class ReferenceLevelsTest : public VideoDescriptorTest,
                             public ::testing::WithParamInterface<LevelsCase> {};
