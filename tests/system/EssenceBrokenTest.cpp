@@ -46,11 +46,9 @@ protected:
         return copy;
     }
     std::filesystem::path HeaderFirst(const char* name) {
-        const auto movie = folder() / (std::string("first_") + name);
-        EXPECT_EQ(RunCommand("ffmpeg -nostdin -y -v error -i " + Quoted(MadeMovie(name)) +
-                             " -map 0 -c copy -movflags +faststart " + Quoted(movie))
-                      .status,
-                  0);
+        const auto movie =
+            Make("-i " + Quoted(MadeMovie(name)) + " -map 0 -c copy -movflags +faststart",
+                 (std::string("first_") + name));
         return movie;
     }
 };
@@ -58,15 +56,12 @@ protected:
 // No memory is allocated for what the file can't hold, and every verb that delivers
 // or promises pictures says why.
 TEST_F(EssenceBroken, PicturesOfAFalseSizeAreNamedByEveryVerb) {
-    const auto movie = folder() / "large.mov";
     for (const char* const encoder : {"mpeg4", "png", "rawvideo"}) {
         SCOPED_TRACE(encoder);
-        ASSERT_EQ(
-            RunCommand("ffmpeg -nostdin -y -v error -f lavfi -i testsrc=s=64x48:r=25 -f lavfi "
-                       "-i sine -t 0.12 -c:a pcm_s16le -c:v " +
-                       std::string(encoder) + " " + Quoted(movie))
-                .status,
-            0);
+        const auto movie =
+            Make("-f lavfi -i testsrc=s=64x48:r=25 -f lavfi -i sine -t 0.12 -c:a pcm_s16le -c:v " +
+                     std::string(encoder),
+                 "large.mov");
         movies::Bytes bytes = ReadFile(movie);
         const std::string table = "stsd";
         const auto description =
@@ -147,13 +142,10 @@ TEST_F(EssenceBroken, PictureIsToldAndLeftOutByTheProgram) {
 
 TEST_F(EssenceBroken, LongGroupIsServedFromItsNextWholePicture) {
     // Two groups of five; the first is damaged in its key picture.
-    const auto movie = folder() / "groups.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=320x180:r=25:d=0.4 -c:v "
-                         "libx264 -preset ultrafast -g 5 -x264-params scenecut=0 -bf 0 "
-                         "-pix_fmt yuv420p " +
-                         Quoted(movie))
-                  .status,
-              0);
+    const auto movie = Make(
+        "-f lavfi -i testsrc2=s=320x180:r=25:d=0.4 -c:v "
+        "libx264 -preset ultrafast -g 5 -x264-params scenecut=0 -bf 0 -pix_fmt yuv420p",
+        "groups.mov");
     EssenceBytes whole;
     MappedSample first;
     {
@@ -243,12 +235,8 @@ TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
     EXPECT_NE(result.out.find("give --rate 48000"), std::string::npos) << result.out;
     EXPECT_FALSE(std::filesystem::exists(wav));
     // Longer than what is read at a time.
-    const auto whole = folder() / "long.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=r=48000:d=4 -c:a pcm_s16le "
-                         "-movflags +faststart " +
-                         Quoted(whole))
-                  .status,
-              0);
+    const auto whole =
+        Make("-f lavfi -i sine=r=48000:d=4 -c:a pcm_s16le -movflags +faststart", "long.mov");
     ExpectSays(RunCliphost("audio " + Quoted(Cut(whole, 0.4)) + " --rate 48000 -o " + Quoted(wav)),
                1, "could not be read and are silent");
     EXPECT_EQ(Decoded(wav, "-f s24le -c:a pcm_s24le").size(), 192000u * 3);
@@ -259,13 +247,11 @@ TEST_F(EssenceBroken, SilenceIsToldByTheProgramAndTheFileStays) {
 TEST_F(EssenceBroken, SoundThatIsCutWithinABlockIsToldWithItsCount) {
     for (const char* const codec : {"pcm_s16le", "aac -aac_pns 0", "alac"}) {
         SCOPED_TRACE(codec);
-        const auto whole = folder() / "whole.mov";
-        ASSERT_EQ(
-            RunCommand("ffmpeg -nostdin -v error -y -f lavfi -i testsrc=d=3:r=25:s=64x64 -f lavfi "
-                       "-i sine=r=48000:d=3 -c:v mjpeg -movflags +faststart -c:a " +
-                       std::string(codec) + " " + Quoted(whole))
-                .status,
-            0);
+        const auto whole = Make(
+            "-f lavfi -i testsrc=d=3:r=25:s=64x64 -f lavfi "
+            "-i sine=r=48000:d=3 -c:v mjpeg -movflags +faststart -c:a " +
+                std::string(codec),
+            "whole.mov");
         const auto cut = Cut(whole, 0.9);
         const auto wav = folder() / "a.wav";
         const CommandResult result = RunCliphost("audio " + Quoted(cut) + " -o " + Quoted(wav));

@@ -9,6 +9,7 @@
 #include <cmath>
 #include <random>
 
+#include "tests/support/Planes.h"
 #include "tests/system/EssenceSupport.h"
 #include "tests/system/SystemTest.h"
 
@@ -112,13 +113,11 @@ protected:
 TEST_F(EssenceAlpha, OfEightBitsIsTheDecoders) {
     for (const char* const codec : {"png -pix_fmt rgba", "qtrle -pix_fmt argb"}) {
         SCOPED_TRACE(codec);
-        const auto movie = folder() / "ramp.mov";
-        ASSERT_EQ(
-            RunCommand("ffmpeg -nostdin -y -v error -f lavfi -i testsrc2=s=96x64:r=25:d=0.2 "
-                       "-vf 'format=rgba,geq=r=r(X\\,Y):g=g(X\\,Y):b=b(X\\,Y):a=X*2+N' -c:v " +
-                       std::string(codec) + " " + Quoted(movie))
-                .status,
-            0);
+        const auto movie = Make(
+            "-f lavfi -i testsrc2=s=96x64:r=25:d=0.2 "
+            "-vf 'format=rgba,geq=r=r(X\\,Y):g=g(X\\,Y):b=b(X\\,Y):a=X*2+N' -c:v " +
+                std::string(codec),
+            "ramp.mov");
         Essence essence(session(), movie);
         const EssenceBytes got = AllFrames(essence, TrackKind::Alpha, "a8");
         const EssenceBytes wanted =
@@ -346,11 +345,8 @@ TEST_F(EssenceFrames, OfAStreamThatChangesItsSizeComeInOneSize) {
     Write(movies::Bytes{'f', 'i', 'l', 'e', ' ', 'a', '.', 'm', 'o', 'v', '\n',
                         'f', 'i', 'l', 'e', ' ', 'b', '.', 'm', 'o', 'v', '\n'},
           "list.txt");
-    const auto movie = folder() / "changes.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f concat -i " + Quoted(folder() / "list.txt") +
-                         " -c copy " + Quoted(movie))
-                  .status,
-              0);
+    const auto movie =
+        Make("-f concat -i " + Quoted(folder() / "list.txt") + " -c copy", "changes.mov");
     EssenceBytes before;
     {
         Essence alone(session(), folder() / "a.mov");

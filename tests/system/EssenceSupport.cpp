@@ -90,16 +90,14 @@ double SignalToNoise16(const std::vector<std::uint16_t>& a, const std::vector<st
     return Ratio(a, b, 65535.0);
 }
 
-EssenceBytes Interleaved422(const EssenceBytes& planes, std::size_t width, std::size_t height) {
-    EssenceBytes out;
-    const std::size_t luma = width * height;
-    for (std::size_t frame = 0; frame + luma * 2 <= planes.size(); frame += luma * 2) {
-        for (std::size_t i = 0; i < luma / 2; ++i) {
-            out.push_back(planes[frame + luma + i]);
-            out.push_back(planes[frame + 2 * i]);
-            out.push_back(planes[frame + luma + luma / 2 + i]);
-            out.push_back(planes[frame + 2 * i + 1]);
-        }
-    }
-    return out;
+void ExpectRandomRange(cliphost::SoundReader& reader, std::mt19937& random,
+                       const EssenceBytes& all) {
+    const std::size_t frame = reader.form().FrameBytes();
+    const std::uint64_t at = random() % reader.Count();
+    const std::uint64_t count = 1 + random() % std::min<std::uint64_t>(5000, reader.Count() - at);
+    const auto block = reader.Read(at, count);
+    ASSERT_EQ(block.size, count * frame);
+    ASSERT_TRUE(std::equal(block.bytes, block.bytes + block.size,
+                           all.begin() + static_cast<std::ptrdiff_t>(at * frame)))
+        << count << " from " << at;
 }

@@ -4,11 +4,13 @@
 
 #include <cstdint>
 #include <filesystem>
+#include <random>
 #include <string>
 #include <vector>
 
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/FrameReader.h"
+#include "reference_host/cliphost/SoundReader.h"
 #include "tests/system/Command.h"
 
 // What the essence tests compare with: FFmpeg's own commands over the same file.
@@ -39,5 +41,6 @@ EssenceBytes OneFrame(cliphost::FrameReader& reader, std::uint64_t frame);
 double SignalToNoise(const EssenceBytes& a, const EssenceBytes& b);
 double SignalToNoise16(const std::vector<std::uint16_t>& a, const std::vector<std::uint16_t>& b);
 
-// Planes of 4:2:2 in 8 bits as Cb Y Cr Y.
-EssenceBytes Interleaved422(const EssenceBytes& planes, std::size_t width, std::size_t height);
+// A random range of a sound is what `all`, the whole sound, holds there.
+void ExpectRandomRange(cliphost::SoundReader& reader, std::mt19937& random,
+                       const EssenceBytes& all);

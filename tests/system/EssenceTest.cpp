@@ -87,13 +87,11 @@ TEST_F(EssenceMap, FindsTheOffsetsThatTheModuleTellsOneByOne) {
 }
 
 TEST_F(EssenceMap, FindsTheOffsetsOfMoviesThatTheLibraryReads) {
-    const auto movie = folder() / "fragments.mp4";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=160x90:r=25:d=4 -vf "
-                         "'setpts=(N+N*N/8)/25/TB' -vsync passthrough -c:v libx264 -bf 3 "
-                         "-pix_fmt yuv420p -movflags frag_keyframe+empty_moov " +
-                         Quoted(movie))
-                  .status,
-              0);
+    const auto movie = Make(
+        "-f lavfi -i testsrc2=s=160x90:r=25:d=4 -vf "
+        "'setpts=(N+N*N/8)/25/TB' -vsync passthrough -c:v libx264 -bf 3 "
+        "-pix_fmt yuv420p -movflags frag_keyframe+empty_moov",
+        "fragments.mp4");
     Essence essence(session(), movie);
     ExpectOffsetsOfTheModule(essence);
 }
@@ -194,11 +192,8 @@ TEST_F(EssenceMap, OfPcmHoldsThePacketsOneBehindTheOther) {
 TEST_F(EssenceMap, OfBlocksOfSoundHoldsEachBlockOnce) {
     for (const char* const codec : {"adpcm_ima_wav", "adpcm_ms"}) {
         SCOPED_TRACE(codec);
-        const auto movie = folder() / (std::string(codec) + ".mov");
-        ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i sine=440:d=1 -ac 2 -c:a " +
-                             std::string(codec) + " " + Quoted(movie))
-                      .status,
-                  0);
+        const auto movie = Make("-f lavfi -i sine=440:d=1 -ac 2 -c:a " + std::string(codec),
+                                (std::string(codec) + ".mov"));
         const auto packets = PacketsOf(movie, "a:0");
         ASSERT_GT(packets.size(), 10u);
         Essence essence(session(), movie);
@@ -258,12 +253,10 @@ TEST_F(EssenceMap, CountsTheTracksThatTheDescriptionHas) {
 // Behind a second picture track the sound has another number in the module than
 // in the description, so it can't be had; the user is told.
 TEST_F(EssenceMap, SaysThatTheSoundBehindASecondPictureCantBeDelivered) {
-    const auto movie = folder() / "two_pictures.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -i " + Quoted(MadeMovie("mjpeg.mov")) + " -i " +
-                         Quoted(MadeMovie("pcm_s16le.mov")) +
-                         " -map 0:v -map 0:v -map 1:a -c copy " + Quoted(movie))
-                  .status,
-              0);
+    const auto movie =
+        Make("-i " + Quoted(MadeMovie("mjpeg.mov")) + " -i " + Quoted(MadeMovie("pcm_s16le.mov")) +
+                 " -map 0:v -map 0:v -map 1:a -c copy",
+             "two_pictures.mov");
     {
         Essence essence(session(), movie);
         ASSERT_EQ(essence.tracks().size(), 2u);
@@ -291,13 +284,12 @@ TEST_F(EssenceMap, IsThatOfThePictureTrackThatIsDescribedAndDelivered) {
                    {"fragments.mp4", "-movflags frag_keyframe+empty_moov", 5, 32}};
     for (const auto& each : kMovies) {
         SCOPED_TRACE(each.name);
-        const auto movie = folder() / each.name;
-        ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=64x48:r=25:d=0.4 "
-                             "-f lavfi -i testsrc2=s=32x16:r=25:d=0.2 -map 0 -map 1 -c:v mpeg4 "
-                             "-streamid 0:5 -streamid 1:2 -use_stream_ids_as_track_ids 1 " +
-                             std::string(each.options) + " " + Quoted(movie))
-                      .status,
-                  0);
+        const auto movie = Make(
+            "-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 "
+            "-f lavfi -i testsrc2=s=32x16:r=25:d=0.2 -map 0 -map 1 -c:v mpeg4 "
+            "-streamid 0:5 -streamid 1:2 -use_stream_ids_as_track_ids 1 " +
+                std::string(each.options),
+            each.name);
         Essence essence(session(), movie);
         const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
         EXPECT_EQ(track.length, each.pictures);

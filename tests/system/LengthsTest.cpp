@@ -143,11 +143,7 @@ TEST_F(Lengths, OfPlainSoundAreThoseOfItsSamples) {
 // A clip that is made of the header, and one that only the wrapper reads: the
 // picture's description lacks a size there.
 TEST_F(Lengths, HaveOneRateOnBothRoutes) {
-    const auto jpeg = folder() / "a.jpg";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc2=s=64x48 -frames:v 1 " +
-                         Quoted(jpeg))
-                  .status,
-              0);
+    const auto jpeg = Make("-f lavfi -i testsrc2=s=64x48 -frames:v 1", "a.jpg");
     const struct {
         std::vector<movies::SampleRun> samples;
         std::uint64_t told;

@@ -208,11 +208,8 @@ INSTANTIATE_TEST_SUITE_P(
 TEST_F(Reasons, TellWhereTheMediaDataEnds) {
     const std::string media = "mdat";
     // With the header in front, a cut leaves it whole.
-    const auto front = folder() / "front.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -i " + Quoted(MadeMovie("png.mov")) +
-                         " -c copy -movflags +faststart " + Quoted(front))
-                  .status,
-              0);
+    const auto front =
+        Make("-i " + Quoted(MadeMovie("png.mov")) + " -c copy -movflags +faststart", "front.mov");
     const movies::Bytes bytes = ReadFile(front);
     const auto found = std::search(bytes.begin(), bytes.end(), media.begin(), media.end());
     const auto begin = static_cast<std::size_t>(found - bytes.begin()) + media.size();
@@ -375,12 +372,9 @@ TEST_F(Reasons, TellThatSoundIsEncryptedOrHasNoDecoder) {
 }
 
 TEST_F(Reasons, CountFramesThatACutFileLacks) {
-    const auto front = folder() / "front.mov";
-    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -f lavfi -i testsrc=d=4:r=25:s=64x64 -c:v "
-                         "libx264 -pix_fmt yuv420p -movflags +faststart " +
-                         Quoted(front))
-                  .status,
-              0);
+    const auto front = Make(
+        "-f lavfi -i testsrc=d=4:r=25:s=64x64 -c:v libx264 -pix_fmt yuv420p -movflags +faststart",
+        "front.mov");
     const movies::Bytes bytes = ReadFile(front);
     Write(CutAt(bytes, bytes.size() * 3 / 4), "cut.mov");
     const std::string words = "are missing or cut off; copy the file again";

@@ -22,12 +22,12 @@ using movies::Bytes;
 
 class SoundForms : public SystemTest {
 protected:
-    std::filesystem::path Make(const std::string& arguments, const std::string& name) {
-        const auto path = folder() / name;
-        EXPECT_EQ(
-            RunCommand("ffmpeg -nostdin -v error -y " + arguments + " " + Quoted(path)).status, 0)
-            << arguments;
-        return path;
+    // A tone in packets of AAC.
+    SoundPackets AacOf(int seconds, int rate) {
+        return SoundPacketsOf(Make("-f lavfi -i sine=440:d=" + std::to_string(seconds) +
+                                       ":sample_rate=" + std::to_string(rate) +
+                                       " -c:a aac -aac_pns 0",
+                                   "a.m4a"));
     }
     std::filesystem::path WriteSound(const movies::Track& track, const std::string& name) {
         movies::Movie movie;
@@ -67,15 +67,7 @@ protected:
         for (int i = 0; i < 12; ++i) {
             Essence essence(session(), movie);
             SoundReader reader(essence, essence.tracks().at(0));
-            const std::size_t frame = reader.form().FrameBytes();
-            const std::uint64_t at = random() % reader.Count();
-            const std::uint64_t count =
-                1 + random() % std::min<std::uint64_t>(5000, reader.Count() - at);
-            const auto block = reader.Read(at, count);
-            ASSERT_EQ(block.size, count * frame);
-            ASSERT_TRUE(std::equal(block.bytes, block.bytes + block.size,
-                                   all.begin() + static_cast<std::ptrdiff_t>(at * frame)))
-                << count << " from " << at;
+            ExpectRandomRange(reader, random, all);
         }
     }
     // `got` is a piece of one channel's `whole`, from `frame` on.
@@ -151,8 +143,7 @@ TEST_F(SoundForms, ThatChangeChannelsOnTheWayAreMixed) {
                                              "-id3v2_version 0"),
                           "two.mp3");
     const auto one = Make(
-        "-f lavfi -i sine=997:d=1:sample_rate=44100 -c:a libmp3lame "
-        "-write_xing 0 -id3v2_version 0",
+        "-f lavfi -i sine=997:d=1:sample_rate=44100 -c:a libmp3lame -write_xing 0 -id3v2_version 0",
         "one.mp3");
     movies::SoundFormat format;
     format.codec = ".mp3";
@@ -225,9 +216,7 @@ TEST_F(SoundForms, ThatChangeTheRateOnTheWayAreResampled) {
 // AAC is made into one that announces more, so that decoders double the rate,
 // and make two channels of one unless it denies that.
 TEST_F(SoundForms, OfAnnouncedExtensionsOfAacAreThoseThatComeOut) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=1:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = SoundPacketsOf(plain);
+    const SoundPackets packets = AacOf(1, 22050);
     struct Kind {
         const char* name;
         Bytes config;
@@ -265,9 +254,7 @@ TEST_F(SoundForms, OfAnnouncedExtensionsOfAacAreThoseThatComeOut) {
 // Packets of AAC that double the rate without a word in the description: what it
 // says is what both readers say, and what is delivered.
 TEST_F(SoundForms, OfExtensionsOfAacThatNothingAnnouncesAreThoseOfTheCore) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=2:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = WithEmptyBandExtension(SoundPacketsOf(plain));
+    const SoundPackets packets = WithEmptyBandExtension(AacOf(2, 22050));
     const auto movie = WriteSound(
         SoundTrackOf(packets, Mpeg4Sound(0x40, {0x13, 0x88}, 1, 22050), 22050, 1024), "more.mov");
     // The decoder does find the extension.
@@ -286,9 +273,7 @@ TEST_F(SoundForms, OfExtensionsOfAacThatNothingAnnouncesAreThoseOfTheCore) {
 // Other tracks do not count, though to describe a picture like this one the
 // library reads on, and then knows more of the sound as well.
 TEST_F(SoundForms, OfTheCoreStayWhereAPictureIsReadBefore) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=2:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = WithEmptyBandExtension(SoundPacketsOf(plain));
+    const SoundPackets packets = WithEmptyBandExtension(AacOf(2, 22050));
     const auto alone = WriteSound(
         SoundTrackOf(packets, Mpeg4Sound(0x40, {0x13, 0x88}, 1, 22050), 22050, 1024), "alone.mov");
     const auto both = Make("-f lavfi -i testsrc=d=2:r=25:s=64x64 -i " + Quoted(alone) +
@@ -324,9 +309,7 @@ TEST_F(SoundForms, HaveTheRateOfTheFieldsWhateverThePacketsHave) {
 // The decoder makes 44100 of what is described with 22050, and a second is left
 // out in the middle.
 TEST_F(SoundForms, KeepAGapWhileTheRateIsConverted) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=2:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = WithEmptyBandExtension(SoundPacketsOf(plain));
+    const SoundPackets packets = WithEmptyBandExtension(AacOf(2, 22050));
     const movies::SoundFormat format = Mpeg4Sound(0x40, {0x13, 0x88}, 1, 22050);
     movies::Track track = SoundTrackOf(packets, format, 22050, 1024);
     track.samples[8].duration += 22050;
@@ -346,9 +329,7 @@ TEST_F(SoundForms, KeepAGapWhileTheRateIsConverted) {
 // The edit begins within a packet, in units that are the sound's frames or not:
 // what is heard is what the media holds from there on, from its first frame.
 TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditWithinAPacket) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=3:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = SoundPacketsOf(plain);
+    const SoundPackets packets = AacOf(3, 44100);
     const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
     const EssenceBytes whole =
         Delivered(WriteSound(SoundTrackOf(packets, format, 44100, 1024), "whole.mov"));
@@ -375,9 +356,7 @@ TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditWithinAPacket) {
 
 // The units are those of the core, of which the decoder makes two frames each.
 TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditInUnitsOfTheCore) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=3:sample_rate=22050 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = SoundPacketsOf(plain);
+    const SoundPackets packets = AacOf(3, 22050);
     const movies::SoundFormat format =
         Mpeg4Sound(0x40, {0x13, 0x88, 0x56, 0xE5, 0xA5, 0x48, 0x00}, 1, 22050);
     const EssenceBytes whole =
@@ -400,9 +379,7 @@ TEST_F(SoundForms, AreThoseOfTheMediaFromAnEditInUnitsOfTheCore) {
 // A writer rounded the length of each packet, not its end: 1115 units of 48000
 // for 1024 frames at 44100. The sound goes on without a gap.
 TEST_F(SoundForms, AreContinuousWhereEachStepIsRounded) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=4:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = SoundPacketsOf(plain);
+    const SoundPackets packets = AacOf(4, 44100);
     const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
     const auto exact = WriteSound(SoundTrackOf(packets, format, 44100, 1024), "exact.mov");
     const auto rounded = WriteSound(SoundTrackOf(packets, format, 48000, 1115), "rounded.mov");
@@ -416,9 +393,7 @@ TEST_F(SoundForms, AreContinuousWhereEachStepIsRounded) {
 // What one packet's own step leaves empty is silence, and what follows it is
 // in its place.
 TEST_F(SoundForms, KeepTheGapThatAStepLeaves) {
-    const auto plain =
-        Make("-f lavfi -i sine=440:d=2:sample_rate=44100 -c:a aac -aac_pns 0", "a.m4a");
-    const SoundPackets packets = SoundPacketsOf(plain);
+    const SoundPackets packets = AacOf(2, 44100);
     const movies::SoundFormat format = Mpeg4Sound(0x40, {0x12, 0x08, 0x56, 0xE5, 0x00}, 1, 44100);
     const auto exact = WriteSound(SoundTrackOf(packets, format, 44100, 1024), "exact.mov");
     movies::Track track = SoundTrackOf(packets, format, 48000, 1115);

@@ -10,6 +10,7 @@
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/framework/ObjectCount.h"
+#include "tests/system/Command.h"
 
 SystemTest::SystemTest() {
     options.programFolder = ProgramFolder();
@@ -66,6 +67,13 @@ std::filesystem::path SystemTest::Write(const movies::Bytes& bytes, const std::s
                  static_cast<std::streamsize>(bytes.size()));
     EXPECT_TRUE(stream.good()) << file;
     return file;
+}
+
+std::filesystem::path SystemTest::Make(const std::string& arguments, const std::string& name) {
+    const auto path = folder() / name;
+    EXPECT_EQ(RunCommand("ffmpeg -nostdin -v error -y " + arguments + " " + Quoted(path)).status, 0)
+        << arguments;
+    return path;
 }
 
 std::filesystem::path ProgramFolder() {

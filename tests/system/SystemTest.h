@@ -42,6 +42,9 @@ protected:
     std::filesystem::path Write(const movies::Movie& movie, const std::string& name = "built.mov");
     std::filesystem::path Write(const movies::Bytes& bytes, const std::string& name);
 
+    // Makes a file in the test's folder by ffmpeg; fails the test when it can't.
+    std::filesystem::path Make(const std::string& arguments, const std::string& name);
+
     // A folder of the test's own, gone with it.
     std::filesystem::path folder() const { return folder_.path(); }
 

@@ -29,26 +29,18 @@ constexpr Container kContainers[] = {{".mov", ""}, {".mp4", "-movflags frag_keyf
 class TurnedPictures : public SystemTest {
 protected:
     // Six pictures without loss, 48 x 32, turned by the filter.
-    std::filesystem::path Make(const std::string& name, const std::string& filter,
+    std::filesystem::path Film(const std::string& name, const std::string& filter,
                                const std::string& more = "") {
-        const std::filesystem::path file = folder() / name;
-        EXPECT_EQ(RunCommand("ffmpeg -nostdin -y -v error -f lavfi -i "
-                             "testsrc2=s=48x32:r=25:d=0.24,format=rgb24 -vf '" +
-                             filter + "' -c:v png -pix_fmt rgb24 " + more + " " + Quoted(file))
-                      .status,
-                  0);
-        return file;
+        return Make("-f lavfi -i testsrc2=s=48x32:r=25:d=0.24,format=rgb24 -vf '" + filter +
+                        "' -c:v png -pix_fmt rgb24 " + more,
+                    name);
     }
     // The same with a display matrix, which only a copied track takes.
     std::filesystem::path MakeTurned(const Turn& turn, const Container& container) {
-        const auto stored = Make("stored.mov", turn.filter);
-        const auto file = folder() / ("turned" + std::string(container.ending));
-        EXPECT_EQ(RunCommand("ffmpeg -nostdin -y -v error -i " + Quoted(stored) +
-                             " -c copy -metadata:s:v rotate=" + turn.degrees + " " +
-                             container.options + " " + Quoted(file))
-                      .status,
-                  0);
-        return file;
+        const auto stored = Film("stored.mov", turn.filter);
+        return Make("-i " + Quoted(stored) + " -c copy -metadata:s:v rotate=" + turn.degrees + " " +
+                        container.options,
+                    std::string("turned") + container.ending);
     }
     // A picture file as R'G'B'.
     EssenceBytes Pixels(const std::filesystem::path& file) {
@@ -68,7 +60,7 @@ protected:
 };
 
 TEST_F(TurnedPictures, OfFramesAreTheRightWayUp) {
-    const EssenceBytes upright = Pixels(Make("upright.mov", "null"));
+    const EssenceBytes upright = Pixels(Film("upright.mov", "null"));
     for (const Container& container : kContainers) {
         for (const Turn& turn : kTurns) {
             SCOPED_TRACE(std::string(turn.degrees) + container.ending);
@@ -111,7 +103,7 @@ TEST_F(TurnedPictures, OfAFolderAreTurnedEach) {
 
 TEST_F(TurnedPictures, OfASheetHaveCellsOfTheirShape) {
     const std::string verb = "contact --frames 4 --columns 2 --width 64";
-    const auto uprightMovie = Make("upright.mov", "null");
+    const auto uprightMovie = Film("upright.mov", "null");
     const EssenceBytes upright = Written(verb, uprightMovie);
     ASSERT_EQ(upright.size(), (2u * 72u + 8u) * (2u * 51u + 8u) * 3u);
     for (const Container& container : kContainers) {

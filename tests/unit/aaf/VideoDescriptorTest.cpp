@@ -11,6 +11,20 @@ namespace {
 
 constexpr char kFunction[] = "NMA::Impl::AddVideoDescriptor";
 
+// Without queries for other interfaces.
+std::vector<std::string> CallsUntilTheLength(const std::vector<std::string>& lines) {
+    std::vector<std::string> calls;
+    for (const std::string& line : lines) {
+        if (line.find("QueryInterface") == std::string::npos) {
+            calls.push_back(line);
+        }
+        if (line.find("SetLength") != std::string::npos) {
+            break;
+        }
+    }
+    return calls;
+}
+
 TEST_F(VideoDescriptorTest, ChecksItsArgumentsInOrder) {
     const std::tr1::shared_ptr<BaseClip> none;
     EXPECT_EQ(AddVideoDescriptor(none, nullptr, nullptr, nullptr, nullptr, nullptr), NCF_E_POINTER);
@@ -37,36 +51,28 @@ TEST_F(VideoDescriptorTest, ChecksItsArgumentsInOrder) {
 
 TEST_F(VideoDescriptorTest, TheSampleProviderRoadInOrder) {
     ASSERT_EQ(Add(), NCF_OK);
-    std::vector<std::string> calls;
-    for (const std::string& line : aaf.journal().lines()) {
-        if (line.find("QueryInterface") == std::string::npos) {
-            calls.push_back(line);
-        }
-        if (line.find("SetLength") != std::string::npos) {
-            break;
-        }
-    }
-    EXPECT_EQ(calls, (std::vector<std::string>{
-                         "Dictionary.CreateInstance CDCIDescriptor",
-                         "CDCIDescriptor1.Initialize",
-                         "MasterMob1.AppendComment 'Video' 'H.264'",
-                         "MasterMob1.AppendComment 'Image Aspect Ratio' '16:9'",
-                         "CDCIDescriptor1.SetBlackReferenceLevel 0",
-                         "CDCIDescriptor1.SetWhiteReferenceLevel 255",
-                         "MasterMob1.AppendComment 'Video File Format' 'MOV'",
-                         "CDCIDescriptor1.SetCompression 0E040201-027F-0000-060E-2B3404010101",
-                         "Dictionary.LookupContainerDef 060E2B34-0401-0101-0E04-040102010100",
-                         "Dictionary.CreateInstance ContainerDef",
-                         "ContainerDef1.Initialize 060E2B34-0401-0101-0E04-040102010100 '' ''",
-                         "Dictionary.RegisterContainerDef ContainerDef1",
-                         "CDCIDescriptor1.SetContainerFormat ContainerDef1",
-                         "CDCIDescriptor1.SetFrameLayout 0",
-                         "CDCIDescriptor1.SetStoredView 1080 1920",
-                         "CDCIDescriptor1.SetSampledView 1080 0 0 0",
-                         "CDCIDescriptor1.SetDisplayView 1080 1920 0 0",
-                         "CDCIDescriptor1.SetImageAspectRatio 16/9",
-                         "CDCIDescriptor1.SetSampleRate 25/1",
-                         "CDCIDescriptor1.SetLength 100"}));
+    EXPECT_EQ(CallsUntilTheLength(aaf.journal().lines()),
+              (std::vector<std::string>{
+                  "Dictionary.CreateInstance CDCIDescriptor",
+                  "CDCIDescriptor1.Initialize",
+                  "MasterMob1.AppendComment 'Video' 'H.264'",
+                  "MasterMob1.AppendComment 'Image Aspect Ratio' '16:9'",
+                  "CDCIDescriptor1.SetBlackReferenceLevel 0",
+                  "CDCIDescriptor1.SetWhiteReferenceLevel 255",
+                  "MasterMob1.AppendComment 'Video File Format' 'MOV'",
+                  "CDCIDescriptor1.SetCompression 0E040201-027F-0000-060E-2B3404010101",
+                  "Dictionary.LookupContainerDef 060E2B34-0401-0101-0E04-040102010100",
+                  "Dictionary.CreateInstance ContainerDef",
+                  "ContainerDef1.Initialize 060E2B34-0401-0101-0E04-040102010100 '' ''",
+                  "Dictionary.RegisterContainerDef ContainerDef1",
+                  "CDCIDescriptor1.SetContainerFormat ContainerDef1",
+                  "CDCIDescriptor1.SetFrameLayout 0",
+                  "CDCIDescriptor1.SetStoredView 1080 1920",
+                  "CDCIDescriptor1.SetSampledView 1080 0 0 0",
+                  "CDCIDescriptor1.SetDisplayView 1080 1920 0 0",
+                  "CDCIDescriptor1.SetImageAspectRatio 16/9",
+                  "CDCIDescriptor1.SetSampleRate 25/1",
+                  "CDCIDescriptor1.SetLength 100"}));
     const std::vector<std::string>& all = aaf.journal().lines();
     EXPECT_EQ(std::vector<std::string>(all.end() - 3, all.end()),
               (std::vector<std::string>{
@@ -165,41 +171,33 @@ TEST_F(VideoDescriptorTest, APictureOfNoSizeIsRefused) {
 TEST_F(VideoDescriptorTest, TheDirectRoadInOrder) {
     MakeNative("cdci");
     ASSERT_EQ(Add(), NCF_OK);
-    std::vector<std::string> calls;
-    for (const std::string& line : aaf.journal().lines()) {
-        if (line.find("QueryInterface") == std::string::npos) {
-            calls.push_back(line);
-        }
-        if (line.find("SetLength") != std::string::npos) {
-            break;
-        }
-    }
-    EXPECT_EQ(calls, (std::vector<std::string>{
-                         "Dictionary.CreateInstance CDCIDescriptor",
-                         "CDCIDescriptor1.Initialize",
-                         "CDCIDescriptor1.SetFieldStartOffset 8",
-                         "CDCIDescriptor1.SetVideoLineMap 42 7",
-                         "CDCIDescriptor1.SetComponentWidth 10",
-                         "CDCIDescriptor1.SetHorizontalSubsampling 2",
-                         "CDCIDescriptor1.SetVerticalSubsampling 1",
-                         "CDCIDescriptor1.SetColorSiting 4",
-                         "CDCIDescriptor1.SetColorRange 897",
-                         "CDCIDescriptor1.SetBlackReferenceLevel 64",
-                         "CDCIDescriptor1.SetWhiteReferenceLevel 940",
-                         "MasterMob1.AppendComment 'Video File Format' 'MOV'",
-                         "CDCIDescriptor1.SetCompression 04010202-0306-0100-060E-2B340401010D",
-                         "Dictionary.LookupContainerDef 0D010301-021C-0100-060E-2B340401010D",
-                         "Dictionary.CreateInstance ContainerDef",
-                         "ContainerDef1.Initialize 0D010301-021C-0100-060E-2B340401010D '' ''",
-                         "Dictionary.RegisterContainerDef ContainerDef1",
-                         "CDCIDescriptor1.SetContainerFormat ContainerDef1",
-                         "CDCIDescriptor1.SetFrameLayout 0",
-                         "CDCIDescriptor1.SetStoredView 1088 1920",
-                         "CDCIDescriptor1.SetSampledView 1088 1918 0 0",
-                         "CDCIDescriptor1.SetDisplayView 1080 1900 0 4",
-                         "CDCIDescriptor1.SetImageAspectRatio 16/9",
-                         "CDCIDescriptor1.SetSampleRate 25/1",
-                         "CDCIDescriptor1.SetLength 100"}));
+    EXPECT_EQ(CallsUntilTheLength(aaf.journal().lines()),
+              (std::vector<std::string>{
+                  "Dictionary.CreateInstance CDCIDescriptor",
+                  "CDCIDescriptor1.Initialize",
+                  "CDCIDescriptor1.SetFieldStartOffset 8",
+                  "CDCIDescriptor1.SetVideoLineMap 42 7",
+                  "CDCIDescriptor1.SetComponentWidth 10",
+                  "CDCIDescriptor1.SetHorizontalSubsampling 2",
+                  "CDCIDescriptor1.SetVerticalSubsampling 1",
+                  "CDCIDescriptor1.SetColorSiting 4",
+                  "CDCIDescriptor1.SetColorRange 897",
+                  "CDCIDescriptor1.SetBlackReferenceLevel 64",
+                  "CDCIDescriptor1.SetWhiteReferenceLevel 940",
+                  "MasterMob1.AppendComment 'Video File Format' 'MOV'",
+                  "CDCIDescriptor1.SetCompression 04010202-0306-0100-060E-2B340401010D",
+                  "Dictionary.LookupContainerDef 0D010301-021C-0100-060E-2B340401010D",
+                  "Dictionary.CreateInstance ContainerDef",
+                  "ContainerDef1.Initialize 0D010301-021C-0100-060E-2B340401010D '' ''",
+                  "Dictionary.RegisterContainerDef ContainerDef1",
+                  "CDCIDescriptor1.SetContainerFormat ContainerDef1",
+                  "CDCIDescriptor1.SetFrameLayout 0",
+                  "CDCIDescriptor1.SetStoredView 1088 1920",
+                  "CDCIDescriptor1.SetSampledView 1088 1918 0 0",
+                  "CDCIDescriptor1.SetDisplayView 1080 1900 0 4",
+                  "CDCIDescriptor1.SetImageAspectRatio 16/9",
+                  "CDCIDescriptor1.SetSampleRate 25/1",
+                  "CDCIDescriptor1.SetLength 100"}));
 }
 
 TEST_F(VideoDescriptorTest, ARecordWithSlicesHasTheirCount) {
@@ -266,44 +264,48 @@ TEST_F(VideoDescriptorTest, AProviderClipAfterAnRgbaClipFails) {
     }
 }
 
-TEST_F(VideoDescriptorTest, TheClipsLevelsWinWhenBothAreGiven) {
-    clip->color().refBlack = 4;
-    clip->color().refWhite = 1019;
-    ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetBlackReferenceLevel 4"));
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetWhiteReferenceLevel 1019"));
+struct LevelsCase {
+    const char* name;
+    const char* record;  // none for the sample provider
+    int refBlack, refWhite;
+    const char* black;
+    const char* white;
+};
+
+void PrintTo(const LevelsCase& given, std::ostream* to) {
+    *to << given.name;
 }
 
-TEST_F(VideoDescriptorTest, OneLevelOfTheClipIsNotEnough) {
-    clip->color().refBlack = 4;
+class ReferenceLevelsTest : public VideoDescriptorTest,
+                            public ::testing::WithParamInterface<LevelsCase> {};
+
+TEST_P(ReferenceLevelsTest, AreThoseOfTheClipWhereItGivesBoth) {
+    const LevelsCase& given = GetParam();
+    if (given.record) {
+        MakeNative(given.record);
+    }
+    clip->color().refBlack = given.refBlack;
+    clip->color().refWhite = given.refWhite;
     ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetBlackReferenceLevel 0"));
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetWhiteReferenceLevel 255"));
+    EXPECT_TRUE(aaf.has(given.black));
+    EXPECT_TRUE(aaf.has(given.white));
 }
 
-TEST_F(VideoDescriptorTest, TheOtherLevelOfTheClipIsNotEnoughEither) {
-    clip->color().refWhite = 1019;
-    ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetBlackReferenceLevel 0"));
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetWhiteReferenceLevel 255"));
-}
-
-TEST_F(VideoDescriptorTest, ALevelIsMissingOnlyWhereAllItsBitsAreSet) {
-    clip->color().refBlack = 0;
-    clip->color().refWhite = -2;
-    ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetBlackReferenceLevel 0"));
-    EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetWhiteReferenceLevel 4294967294"));
-}
-
-TEST_F(VideoDescriptorTest, TheClipsLevelsGoToAnRgbaDescriptorToo) {
-    MakeNative("rgba");
-    clip->color().refBlack = 16;
-    clip->color().refWhite = 235;
-    ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_TRUE(aaf.has("RGBADescriptor1.SetComponentMinRef 16"));
-    EXPECT_TRUE(aaf.has("RGBADescriptor1.SetComponentMaxRef 235"));
-}
+// A level is missing only where all its bits are set.
+INSTANTIATE_TEST_SUITE_P(
+    Levels, ReferenceLevelsTest,
+    ::testing::Values(
+        LevelsCase{"both", nullptr, 4, 1019, "CDCIDescriptor1.SetBlackReferenceLevel 4",
+                   "CDCIDescriptor1.SetWhiteReferenceLevel 1019"},
+        LevelsCase{"black_alone", nullptr, 4, -1, "CDCIDescriptor1.SetBlackReferenceLevel 0",
+                   "CDCIDescriptor1.SetWhiteReferenceLevel 255"},
+        LevelsCase{"white_alone", nullptr, -1, 1019, "CDCIDescriptor1.SetBlackReferenceLevel 0",
+                   "CDCIDescriptor1.SetWhiteReferenceLevel 255"},
+        LevelsCase{"not_all_bits", nullptr, 0, -2, "CDCIDescriptor1.SetBlackReferenceLevel 0",
+                   "CDCIDescriptor1.SetWhiteReferenceLevel 4294967294"},
+        LevelsCase{"rgba", "rgba", 16, 235, "RGBADescriptor1.SetComponentMinRef 16",
+                   "RGBADescriptor1.SetComponentMaxRef 235"}),
+    [](const auto& test) { return std::string(test.param.name); });
 
 TEST_F(VideoDescriptorTest, AVendorsMetadataIsToldAndLabelled) {
     clip->color().hasVendorMetadata = true;

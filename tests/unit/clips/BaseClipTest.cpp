@@ -37,11 +37,19 @@ protected:
         Video().mediaDuration = 250;
         Video().trackTimescale = 1000;
         Video().trackDuration = 10000;
+        LoadWithTiming();
+    }
+    FakeAudioTrack& Sound() { return *parser->audioTracks[0]; }
+    void LoadWithTiming() {
         Load();
         clip->SetEditRate(EditorSettings());
         clip->SetMovieLength(EditorSettings());
     }
-    FakeAudioTrack& Sound() { return *parser->audioTracks[0]; }
+    ncfUInt64 Length(bool* enough = nullptr) {
+        ncfUInt64 samples = 0;
+        EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, enough), NCF_OK);
+        return samples;
+    }
 };
 
 }  // namespace
@@ -136,10 +144,8 @@ TEST(BaseClip, NamesOtherCodecsUnknown) {
 // --- sound beside the picture ----------------------------------------------------------------
 
 TEST_F(BaseClipSound, GivesThePicturesFigureWhenBothAreEquallyLong) {
-    ncfUInt64 samples = 0;
     bool enough = false;
-    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
-    EXPECT_EQ(samples, 480000u);
+    EXPECT_EQ(Length(&enough), 480000u);
     EXPECT_TRUE(enough);
     EXPECT_TRUE(
         log->once("BaseClip::ObtainAudioTrackLengthaudioSamplesInVideoTS: 480000; "
@@ -148,10 +154,8 @@ TEST_F(BaseClipSound, GivesThePicturesFigureWhenBothAreEquallyLong) {
 
 TEST_F(BaseClipSound, CutsSoundToThePicture) {
     Sound().trackDuration = 10500;
-    ncfUInt64 samples = 0;
     bool enough = false;
-    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
-    EXPECT_EQ(samples, 480000u);
+    EXPECT_EQ(Length(&enough), 480000u);
     EXPECT_TRUE(enough);
 }
 
@@ -161,12 +165,8 @@ TEST_F(BaseClipSound, RoundsThePicturesFigure) {
     Video().mediaDuration = 2002;
     Video().trackDuration = 67;
     Sound().description->rate = 44100.0;
-    Load();
-    clip->SetEditRate(EditorSettings());
-    clip->SetMovieLength(EditorSettings());
-    ncfUInt64 samples = 0;
-    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_OK);
-    EXPECT_EQ(samples, 2943u);  // 2942.94
+    LoadWithTiming();
+    EXPECT_EQ(Length(), 2943u);  // 2942.94
 }
 
 // 440 pictures last 809308.5 samples, but the samples of one picture are
@@ -179,25 +179,19 @@ TEST_F(BaseClipSound, TakesTheSamplesOfOnePictureFirst) {
     Video().trackDuration = 440 * 1001;
     Sound().description->rate = 44100.0;
     Sound().trackDuration = 20000;
-    Load();
-    clip->SetEditRate(EditorSettings());
-    clip->SetMovieLength(EditorSettings());
-    ncfUInt64 samples = 0;
-    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_OK);
-    EXPECT_EQ(samples, 809308u);
+    LoadWithTiming();
+    EXPECT_EQ(Length(), 809308u);
 }
 
 TEST_F(BaseClipSound, KeepsShortSoundAsItIs) {
     Sound().trackDuration = 9000;
-    ncfUInt64 samples = 0;
     bool enough = true;
-    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples, &enough), NCF_OK);
-    EXPECT_EQ(samples, 432000u);
+    EXPECT_EQ(Length(&enough), 432000u);
     EXPECT_FALSE(enough);
     EXPECT_TRUE(
         log->once("BaseClip::ObtainAudioTrackLengthNot enough audio, "
                   "audioSamplesInVideoTS(480000) > audioSamplesInAudioTrackTS(432000)"));
-    EXPECT_EQ(clip->ObtainAudioTrackLength(2, &samples), NCF_OK) << "without the flag";
+    EXPECT_EQ(Length(), 432000u) << "without the flag";
 }
 
 TEST_F(BaseClipSound, HandsItsFailuresOn) {

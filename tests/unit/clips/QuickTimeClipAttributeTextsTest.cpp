@@ -167,11 +167,9 @@ TEST_F(QuickTimeClipAttributeTexts, FallsBackOnATextThatIsNotThere) {
     Picture().SetRasterText("");
     EXPECT_FALSE(Color("").hasVendorMetadata);
     EXPECT_TRUE(
-        log->once("CHK_PTR(pCMString.inArg())"
-                  "QuickTimeClip::SetColorSpaceImplFromSpecificMedia"));
+        log->once("CHK_PTR(pCMString.inArg())QuickTimeClip::SetColorSpaceImplFromSpecificMedia"));
     EXPECT_TRUE(
-        log->once("CHK_PTR(pRIString.inArg())"
-                  "QuickTimeClip::SetGeometryImplFromSpecificMedia"));
+        log->once("CHK_PTR(pRIString.inArg())QuickTimeClip::SetGeometryImplFromSpecificMedia"));
 }
 
 TEST_F(QuickTimeClipAttributeTexts, FallsBackWhenTheTextsThrow) {

@@ -255,8 +255,7 @@ TEST_F(QuickTimeClipLoading, TellsTheUserOfAMovieWithoutPictureAndSound) {
     EXPECT_FALSE(clip->IsLoaded());
     EXPECT_EQ(Console(1, "Movie doesn't contain any video/audio tracks!\n"), 1);
     EXPECT_TRUE(
-        log->once("QuickTimeClip::LoadClipImplInitialization failed: No one audio/video "
-                  "tracks"));
+        log->once("QuickTimeClip::LoadClipImplInitialization failed: No one audio/video tracks"));
     EXPECT_EQ(log->records().back().kind, slog::kWarning);
     EXPECT_EQ(clip->LoadClipImpl(), NMA_E_NODATA);
 }

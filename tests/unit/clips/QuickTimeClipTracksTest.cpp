@@ -535,7 +535,6 @@ TEST_F(QuickTimeClipTracks, HandsRefusedServicesOnWithTheirText) {
     EXPECT_TRUE(name.isNull());
     EXPECT_TRUE(log->returned("80000002",
                               "(componentFactory_.inArg())->CreateComponent("
-                              "NCFCompID_NCFString, 0, IID_PPV_ARG(INCFString, "
-                              "&codecName))",
+                              "NCFCompID_NCFString, 0, IID_PPV_ARG(INCFString, &codecName))",
                               "QuickTimeClip::GetCodecName"));
 }

@@ -428,8 +428,7 @@ TEST_F(Container, MappingOfAFileThatIsNoMovieFailsAndLeavesNothing) {
     EXPECT_EQ(mapping, nullptr);
     EXPECT_TRUE(
         log.once("NCF_RETURN(0xa0000068): LoadMedia(filePath_, console_, "
-                 "componentFactory_, media_) : "
-                 "NMA::Impl::QuickTimeContainer::GetSampleMapping"));
+                 "componentFactory_, media_) : NMA::Impl::QuickTimeContainer::GetSampleMapping"));
     // The clip that failed is kept, so the next mapping stands over that one.
     ASSERT_EQ(object->GetSampleMapping(&mapping), NCF_OK);
     EXPECT_EQ(host.creations(NCFCompID_QTParser), 1);

@@ -7,7 +7,26 @@
 
 namespace {
 
-using QTParametersEvents = QTParametersFixture;
+class QTParametersEvents : public QTParametersFixture {
+protected:
+    NCFRESULT SetValues(std::vector<std::pair<GUID, ncfUInt32>> values) {
+        Told told;
+        told.values = std::move(values);
+        return Set(told);
+    }
+    // Told that a set in use begins.
+    static void BeginSet(QTParameters& events) {
+        events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
+        events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
+    }
+    // Attached and within a set, with a value of 3.
+    QTParameters& EventsInASet() {
+        Attach();
+        value->hold(3);
+        BeginSet(object());
+        return object();
+    }
+};
 
 TEST_F(QTParametersEvents, ReadTheDocumentThenRefreshTheMapping) {
     Attach();
@@ -22,9 +41,9 @@ TEST_F(QTParametersEvents, ReadTheDocumentThenRefreshTheMapping) {
 
 TEST_F(QTParametersEvents, TakeTheThreeValuesOfTheSetInUse) {
     Attach();
-    Told told;
-    told.values = {{kParamFieldOrdering, 4096}, {kParamFieldLayout, 3}, {kParamLevelRemapping, 2}};
-    EXPECT_EQ(Set(told), NCF_OK);
+    EXPECT_EQ(
+        SetValues({{kParamFieldOrdering, 4096}, {kParamFieldLayout, 3}, {kParamLevelRemapping, 2}}),
+        NCF_OK);
     EXPECT_EQ(Record().fieldOrderInFile, 4096u);
     EXPECT_EQ(Record().fieldLayout, 3u);
     EXPECT_EQ(Record().levelRemap, 2u);
@@ -34,9 +53,7 @@ TEST_F(QTParametersEvents, TakeTheThreeValuesOfTheSetInUse) {
 
 TEST_F(QTParametersEvents, TakeNumbersThatAreNoChoices) {
     Attach();
-    Told told;
-    told.values = {{kParamLevelRemapping, 7}, {kParamFieldLayout, 0xFFFFFFFF}};
-    EXPECT_EQ(Set(told), NCF_OK);
+    EXPECT_EQ(SetValues({{kParamLevelRemapping, 7}, {kParamFieldLayout, 0xFFFFFFFF}}), NCF_OK);
     EXPECT_EQ(Record().levelRemap, 7u);
     EXPECT_EQ(Record().fieldLayout, 0xFFFFFFFFu);
     EXPECT_EQ(Offered(0), (Lines{"8/4/2/1/1 <- NVZ2"})) << "any level but the default adds this";
@@ -44,9 +61,7 @@ TEST_F(QTParametersEvents, TakeNumbersThatAreNoChoices) {
 
 TEST_F(QTParametersEvents, PassOverParametersThatAreNotTheirs) {
     Attach();
-    Told told;
-    told.values = {{kParamGroup, 99}, {kCustom, 98}, {kParamFieldLayout, 3}};
-    EXPECT_EQ(Set(told), NCF_OK);
+    EXPECT_EQ(SetValues({{kParamGroup, 99}, {kCustom, 98}, {kParamFieldLayout, 3}}), NCF_OK);
     EXPECT_EQ(Record().fieldLayout, 3u) << "what follows is read";
     EXPECT_EQ(Record().fieldOrderInFile, 8192u);
     EXPECT_EQ(Record().levelRemap, 16u);
@@ -109,41 +124,28 @@ TEST_F(QTParametersEvents, StopTakingValuesAtTheNextSetThatIsNotInUse) {
 }
 
 TEST_F(QTParametersEvents, AComponentLeavesTheSetBeforeIt) {
-    Attach();
-    QTParameters& events = object();
-    value->hold(3);
-    events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
-    events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
+    QTParameters& events = EventsInASet();
     events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
     EXPECT_EQ(events.ParamValue(kParamFieldLayout, value), NCF_OK);
     EXPECT_EQ(Record().fieldLayout, 1u);
 }
 
 TEST_F(QTParametersEvents, AnEndOfAComponentCountsOnlyWithItsFlag) {
-    Attach();
-    QTParameters& events = object();
-    value->hold(3);
-    events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
-    events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
+    QTParameters& events = EventsInASet();
     EXPECT_EQ(events.EndComponent(1), NCF_OK);
     EXPECT_EQ(events.ParamValue(kParamFieldLayout, value), NCF_OK);
     EXPECT_EQ(Record().fieldLayout, 1u);
     events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
     events.ParamValue(kParamFieldLayout, value);
     EXPECT_EQ(Record().fieldLayout, 1u) << "the component is over too";
-    events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
-    events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
+    BeginSet(events);
     EXPECT_EQ(events.EndComponent(0), NCF_OK);
     EXPECT_EQ(events.ParamValue(kParamFieldLayout, value), NCF_OK);
     EXPECT_EQ(Record().fieldLayout, 3u);
 }
 
 TEST_F(QTParametersEvents, TheEndOfADocumentEndsSetAndComponent) {
-    Attach();
-    QTParameters& events = object();
-    value->hold(3);
-    events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
-    events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
+    QTParameters& events = EventsInASet();
     EXPECT_EQ(events.EndDocument(), NCF_OK);
     events.ParamValue(kParamFieldLayout, value);
     events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
@@ -154,11 +156,7 @@ TEST_F(QTParametersEvents, TheEndOfADocumentEndsSetAndComponent) {
 // A new document begins outside any component; the set is left by the component
 // that comes next.
 TEST_F(QTParametersEvents, TheBeginningOfADocumentEndsTheComponent) {
-    Attach();
-    QTParameters& events = object();
-    value->hold(3);
-    events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
-    events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
+    QTParameters& events = EventsInASet();
     EXPECT_EQ(events.BeginDocument(), NCF_OK);
     events.ParamValue(kParamFieldLayout, value);
     EXPECT_EQ(Record().fieldLayout, 1u);
@@ -167,10 +165,7 @@ TEST_F(QTParametersEvents, TheBeginningOfADocumentEndsTheComponent) {
 // --- failures ---------------------------------------------------------------------------
 
 TEST_F(QTParametersEvents, GiveTheFailureOfAValueThatHoldsTooLittle) {
-    Attach();
-    QTParameters& events = object();
-    events.BeginComponent(NMA::CompID_QuickTimeSampleMapping);
-    events.BeginParamSet(kCustom, nullptr, 1.0f, 1);
+    QTParameters& events = EventsInASet();
     for (const std::size_t size : {0, 1, 3}) {
         value->bytes.assign(size, 0x55);
         EXPECT_EQ(events.ParamValue(kParamLevelRemapping, value), NCF_E_FAIL) << size;
@@ -214,9 +209,7 @@ TEST_F(QTParametersEvents, GiveTheRefusalsOfTheReader) {
 TEST_F(QTParametersEvents, SucceedWhateverTheRefreshGives) {
     Attach();
     clip->results["SetFieldLayoutDetails"] = NCF_E_HANDLE;
-    Told told;
-    told.values = {{kParamFieldLayout, 3}};
-    EXPECT_EQ(Set(told), NCF_OK);
+    EXPECT_EQ(SetValues({{kParamFieldLayout, 3}}), NCF_OK);
     EXPECT_EQ(journal.count("clip.SetFieldLayoutDetails"), 1);
     EXPECT_EQ(Record().fieldLayout, 3u);
 }
@@ -228,9 +221,7 @@ TEST_F(QTParametersEvents, TwoObjectsOfOneMappingShareTheClipAndNotTheSet) {
     NCFSmartPtr<INCFParametersXML> second;
     second.attach(static_cast<INCFParametersXML*>(out));
     ASSERT_NE(second.inArg(), parameters.inArg());
-    Told told;
-    told.values = {{kParamLevelRemapping, 1}};
-    EXPECT_EQ(Set(told), NCF_OK);
+    EXPECT_EQ(SetValues({{kParamLevelRemapping, 1}}), NCF_OK);
     std::swap(second, parameters);
     EXPECT_EQ(CurrentSet(), "set:default 'Default Settings' 0 1.0 1");
     EXPECT_EQ(journal.count("suite.AddParamValue levels 1"), 1);

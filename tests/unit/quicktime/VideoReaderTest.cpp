@@ -11,6 +11,7 @@
 #include <thread>
 #include <tuple>
 
+#include "tests/support/Planes.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;
@@ -21,21 +22,6 @@ constexpr char kFilm[] = "-f lavfi -i testsrc2=s=96x64:r=25:d=1 ";
 // The library's own conversion is exact between lines for planes alone.
 constexpr char kLinearPlanes[] =
     "-vf scale=flags=bilinear+accurate_rnd+full_chroma_int+full_chroma_inp";
-
-// Planes of 4:2:2 as Cb Y Cr Y.
-Bytes Interleaved(const Bytes& planes, std::size_t width, std::size_t height) {
-    Bytes out;
-    const std::size_t luma = width * height;
-    for (std::size_t frame = 0; frame + luma * 2 <= planes.size(); frame += luma * 2) {
-        for (std::size_t i = 0; i < luma / 2; ++i) {
-            out.push_back(planes[frame + luma + i]);
-            out.push_back(planes[frame + 2 * i]);
-            out.push_back(planes[frame + luma + luma / 2 + i]);
-            out.push_back(planes[frame + 2 * i + 1]);
-        }
-    }
-    return out;
-}
 
 // Planes of green, blue and red as B G R A.
 Bytes InterleavedRgb(const Bytes& planes, std::size_t pixels) {
@@ -150,7 +136,7 @@ TEST(VideoReader, MakesChromaBetweenLinesOfProgressivePicturesLinearly) {
     const MadeMovie movie(std::string(kFilm) + "-c:v libx264 -pix_fmt yuv420p -bf 2 -g 12");
     const Bytes planes =
         movie.Decoded(std::string(kLinearPlanes) + " -f rawvideo -pix_fmt yuv422p");
-    EXPECT_GT(Psnr(AllOf(movie, "2vuy"), Interleaved(planes, 96, 64)), 60.0);
+    EXPECT_GT(Psnr(AllOf(movie, "2vuy"), Interleaved422(planes, 96, 64)), 60.0);
 }
 
 TEST(VideoReader, MakesChromaOfInterlacedPicturesFieldByField) {
@@ -162,8 +148,8 @@ TEST(VideoReader, MakesChromaOfInterlacedPicturesFieldByField) {
     const std::string raw = " -f rawvideo -pix_fmt yuv422p";
     const Bytes fields = movie.Decoded(std::string(kLinearPlanes) + ":interl=1" + raw);
     const Bytes frames = movie.Decoded(std::string(kLinearPlanes) + ":interl=0" + raw);
-    EXPECT_GT(Psnr(got, Interleaved(fields, 96, 64)), 58.0);
-    EXPECT_LT(Psnr(got, Interleaved(frames, 96, 64)), 50.0);
+    EXPECT_GT(Psnr(got, Interleaved422(fields, 96, 64)), 58.0);
+    EXPECT_LT(Psnr(got, Interleaved422(frames, 96, 64)), 50.0);
 }
 
 TEST(VideoReader, TurnsYuvIntoRgbByTheStreamsMatrix) {
@@ -360,9 +346,9 @@ TEST_P(EveryCodec, GivesEachPictureInAnyOrder) {
     ncfUInt64 count = 0;
     const Bytes all = AllOf(movie, "2vuy", &count);
     const Bytes reference =
-        Interleaved(movie.Decoded("-map 0:v:0 -vsync 0 " + std::string(kLinearPlanes) +
-                                  " -f rawvideo -pix_fmt yuv422p"),
-                    96, 64);
+        Interleaved422(movie.Decoded("-map 0:v:0 -vsync 0 " + std::string(kLinearPlanes) +
+                                     " -f rawvideo -pix_fmt yuv422p"),
+                       96, 64);
     ASSERT_EQ(all.size(), reference.size());
     EXPECT_GT(Psnr(all, reference), GetParam().likeness);
     ASSERT_GT(count, 1u);

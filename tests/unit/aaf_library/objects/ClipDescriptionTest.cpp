@@ -34,11 +34,9 @@ TEST_F(ClipDescription, LetsTheFileOutliveItsMaker) {
     dictionary_.Reset();
     file_.Reset();
     Ptr<IAAFFile> file(handedOver);
-    Ptr<IAAFHeader> header;
-    Ptr<IAAFMob> mob;
     EXPECT_EQ(1u, ReferencesOf(file.get()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0x01), mob.Out()));
+    Ptr<IAAFHeader> header = Get(file, &IAAFFile::GetHeader);
+    Ptr<IAAFMob> mob = Get(header, &IAAFHeader::LookupMob, MobId(0x01));
 }
 
 TEST_F(ClipDescription, GivesEssenceSlotsOneIdInAllMobs) {
@@ -58,13 +56,12 @@ TEST_F(ClipDescription, GivesEssenceSlotsOneIdInAllMobs) {
         EXPECT_EQ(2u, count);
         for (aafSlotID_t id : {2u, 3u}) {
             Ptr<IAAFMobSlot> slot;
-            Ptr<IAAFSegment> segment;
             aafLength_t length = 0;
             aafSourceRef_t reference{};
             ASSERT_EQ(AAFRESULT_SUCCESS, entry.mob->LookupSlot(id, slot.Out()));
             EXPECT_EQ(
                 L"", TextOf<IAAFMobSlot>(slot, &IAAFMobSlot::GetNameBufLen, &IAAFMobSlot::GetName));
-            ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+            Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
             EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(segment)->GetLength(&length));
             EXPECT_EQ(entry.length, length);
             EXPECT_EQ(AAFRESULT_SUCCESS,
@@ -74,10 +71,9 @@ TEST_F(ClipDescription, GivesEssenceSlotsOneIdInAllMobs) {
     }
     MoveFileMobClips(77);
     Ptr<IAAFMobSlot> slot;
-    Ptr<IAAFSegment> segment;
     aafSourceRef_t reference{};
     ASSERT_EQ(AAFRESULT_SUCCESS, file_mob_->LookupSlot(3, slot.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&reference));
     EXPECT_EQ(77, reference.startTime);
 }
@@ -87,10 +83,9 @@ TEST_F(ClipDescription, PutsLaterTimecodeBetweenFillers) {
     AddTimecode({0, 0, 30}, 2592000, 2592000, 1, 0);
     AddTimecode({1234, 1, 30}, 300, 2592000, 2, 1);
     Ptr<IAAFMobSlot> slot;
-    Ptr<IAAFSegment> segment;
     ASSERT_EQ(AAFRESULT_SUCCESS, source_->LookupSlot(2, slot.Out()));
     EXPECT_EQ(3u, Get(slot, &IAAFMobSlot::GetPhysicalNum));
-    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     EXPECT_EQ(3u, Get(As<IAAFSequence>(segment), &IAAFSequence::CountComponents));
     EXPECT_EQ(2592000, Get(As<IAAFComponent>(segment), &IAAFComponent::GetLength));
 }
@@ -118,15 +113,14 @@ TEST_F(ClipDescription, KeepsTheBoxesOfAPicture) {
     ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->GetFileDescriptorAt(0, picture.Out()));
     Ptr<IAAFClassDef> pictures;
     Ptr<IAAFPropertyDef> property;
-    Ptr<IAAFPropertyValue> value;
-    Ptr<IAAFTypeDef> type;
     ASSERT_EQ(AAFRESULT_SUCCESS,
               dictionary_->LookupClassDef(AUID_AAFCDCIDescriptor, pictures.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS,
               pictures->LookupPropertyDef(ncfGuid("0E040101-0101-0106-060E-2B3401010101"),
                                           property.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(picture)->GetPropertyValue(property, value.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, value->GetType(type.Out()));
+    Ptr<IAAFPropertyValue> value =
+        Get(As<IAAFObject>(picture), &IAAFObject::GetPropertyValue, property);
+    Ptr<IAAFTypeDef> type = Get(value, &IAAFPropertyValue::GetType);
     aafRational_t box[4] = {};
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTypeDefRecord>(type)->GetStruct(
                                      value, reinterpret_cast<aafMemPtr_t>(box), sizeof box));
@@ -147,17 +141,15 @@ TEST_F(ClipDescription, KeepsColumnsAppCodeAndAttributeList) {
                      {L"Field Ordering", L"Default"},
                      {L"GFX-Video Level", L"Do not modify levels"}}),
               Comments(master_));
-    Ptr<IAAFClassDef> mobs;
     Ptr<IAAFPropertyDef> property;
-    Ptr<IAAFPropertyValue> list;
-    Ptr<IAAFTypeDef> type;
     aafUInt32 count = 0;
-    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupClassDef(AUID_AAFMob, mobs.Out()));
+    Ptr<IAAFClassDef> mobs = Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFMob);
     ASSERT_EQ(
         AAFRESULT_SUCCESS,
         mobs->LookupPropertyDef(ncfGuid("60958183-47B1-11D4-A01C-0004AC969F50"), property.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(master_)->GetPropertyValue(property, list.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, list->GetType(type.Out()));
+    Ptr<IAAFPropertyValue> list =
+        Get(As<IAAFObject>(master_), &IAAFObject::GetPropertyValue, property);
+    Ptr<IAAFTypeDef> type = Get(list, &IAAFPropertyValue::GetType);
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTypeDefVariableArray>(type)->GetCount(list, &count));
     EXPECT_EQ(1u, count);
 }

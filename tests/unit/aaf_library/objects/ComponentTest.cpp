@@ -53,22 +53,18 @@ TEST_F(Component, TakesDataDefinitionsOfTheDictionaryOnly) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, component->SetDataDef(nullptr));
     EXPECT_EQ(AAFRESULT_OBJECT_NOT_ATTACHED, component->SetDataDef(loose));
     EXPECT_EQ(AAFRESULT_SUCCESS, component->SetDataDef(DataDef(kAAFDataDef_Sound)));
-    Ptr<IAAFDataDef> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, component->GetDataDef(found.Out()));
+    Ptr<IAAFDataDef> found = Get(component, &IAAFComponent::GetDataDef);
     EXPECT_EQ(DataDef(kAAFDataDef_Sound).get(), found.get());
 }
 
 TEST_F(Component, TakesTheLikeNamedDefinitionOfAnotherFile) {
     Ptr<IAAFFile> other;
-    Ptr<IAAFDictionary> dictionary;
-    Ptr<IAAFDataDef> theirs;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, other.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, other->GetDictionary(dictionary.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->LookupDataDef(kAAFDataDef_Sound, theirs.Out()));
+    Ptr<IAAFDictionary> dictionary = Get(other, &IAAFFile::GetDictionary);
+    Ptr<IAAFDataDef> theirs = Get(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Sound);
     Ptr<IAAFComponent> component = Make<IAAFComponent>(AUID_AAFFiller);
     EXPECT_EQ(AAFRESULT_SUCCESS, component->SetDataDef(theirs));
-    Ptr<IAAFDataDef> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, component->GetDataDef(found.Out()));
+    Ptr<IAAFDataDef> found = Get(component, &IAAFComponent::GetDataDef);
     EXPECT_EQ(DataDef(kAAFDataDef_Sound).get(), found.get());
 }
 
@@ -86,9 +82,8 @@ TEST_F(Component, KeepsCommentsAndAttributesWithTheirDuplicates) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, component->AppendAttribute(L"n", nullptr));
     EXPECT_EQ(2u, Get(component, &IAAFComponent2::CountComments));
     EXPECT_EQ(2u, Get(component, &IAAFComponent2::CountAttributes));
-    Ptr<IAAFTaggedValue> value;
     ASSERT_EQ(AAFRESULT_SUCCESS, component->GetAttributes(all.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
+    Ptr<IAAFTaggedValue> value = Get(all, &IEnumAAFTaggedValues::NextOne);
     EXPECT_EQ(AAFRESULT_OBJECT_NOT_FOUND, component->RemoveComment(value));
     EXPECT_EQ(AAFRESULT_SUCCESS, component->RemoveAttribute(value));
 }
@@ -115,8 +110,7 @@ TEST_F(Component, OfTimecodeBringsItsDataDefinitionAlong) {
     EXPECT_EQ(AAFRESULT_SUCCESS, timecode->GetTimecode(&found));
     EXPECT_EQ(-7, found.startFrame);
     EXPECT_EQ(0, found.fps);
-    Ptr<IAAFDataDef> dataDef;
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFComponent>(timecode)->GetDataDef(dataDef.Out()));
+    Ptr<IAAFDataDef> dataDef = Get(As<IAAFComponent>(timecode), &IAAFComponent::GetDataDef);
     EXPECT_EQ(DataDef(kAAFDataDef_LegacyTimecode).get(), dataDef.get());
     EXPECT_EQ(5, Get(As<IAAFComponent>(timecode), &IAAFComponent::GetLength));
 }
@@ -288,18 +282,16 @@ TEST_F(Sequence, GivesAndRemovesComponentsByPlace) {
     EXPECT_EQ(AAFRESULT_BADINDEX, sequence->InsertComponentAt(3, parts[1]));
     ASSERT_EQ(AAFRESULT_SUCCESS, sequence->InsertComponentAt(1, parts[1]));
     for (aafUInt32 at = 0; at < 3; ++at) {
-        Ptr<IAAFComponent> found;
-        EXPECT_EQ(AAFRESULT_SUCCESS, sequence->GetComponentAt(at, found.Out()));
+        Ptr<IAAFComponent> found = Get(sequence, &IAAFSequence::GetComponentAt, at);
         EXPECT_EQ(parts[at].get(), found.get());
     }
     Ptr<IAAFComponent> found;
-    Ptr<IEnumAAFComponents> all;
     EXPECT_EQ(AAFRESULT_BADINDEX, sequence->GetComponentAt(3, found.Out()));
     EXPECT_EQ(AAFRESULT_BADINDEX, sequence->RemoveComponentAt(3));
     EXPECT_EQ(AAFRESULT_SUCCESS, sequence->RemoveComponentAt(1));
     EXPECT_EQ(5, LengthOf(sequence));
     EXPECT_EQ(2u, Get(sequence, &IAAFSequence::CountComponents));
-    ASSERT_EQ(AAFRESULT_SUCCESS, sequence->GetComponents(all.Out()));
+    Ptr<IEnumAAFComponents> all = Get(sequence, &IAAFSequence::GetComponents);
     IAAFComponent* both[3] = {};
     aafUInt32 fetched = 0;
     EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->Next(3, both, &fetched));
@@ -321,8 +313,7 @@ TEST_F(Component, OfOtherProgramsKeepsItsParts) {
 
     Ptr<IAAFTransition> transition = Make<IAAFTransition>(AUID_AAFTransition);
     ASSERT_EQ(AAFRESULT_SUCCESS, transition->SetOperationGroup(group));
-    Ptr<IAAFOperationGroup> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, transition->GetOperationGroup(found.Out()));
+    Ptr<IAAFOperationGroup> found = Get(transition, &IAAFTransition::GetOperationGroup);
     EXPECT_EQ(group.get(), found.get());
 
     Ptr<IAAFSelector> selector = Make<IAAFSelector>(AUID_AAFSelector);

@@ -50,8 +50,7 @@ TEST_F(Descriptor, TakesContainersThatTheDictionaryHas) {
     EXPECT_EQ(AAFRESULT_INVALID_OBJ, file->SetContainerFormat(container));
     ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterContainerDef(container));
     EXPECT_EQ(AAFRESULT_SUCCESS, file->SetContainerFormat(container));
-    Ptr<IAAFContainerDef> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, file->GetContainerFormat(found.Out()));
+    Ptr<IAAFContainerDef> found = Get(file, &IAAFFileDescriptor::GetContainerFormat);
     EXPECT_EQ(container.get(), found.get());
 }
 
@@ -300,8 +299,7 @@ TEST_F(Descriptor, OfSeveralKindsKeepsItsPartsInOrder) {
     EXPECT_EQ(AAFRESULT_SUCCESS, multiple->PrependFileDescriptor(parts[0]));
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED,
               multiple->AppendFileDescriptor(As<IAAFFileDescriptor>(multiple)));
-    Ptr<IAAFFileDescriptor> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, multiple->GetFileDescriptorAt(0, found.Out()));
+    Ptr<IAAFFileDescriptor> found = Get(multiple, &IAAFMultipleDescriptor::GetFileDescriptorAt, 0);
     EXPECT_EQ(parts[0].get(), found.get());
     EXPECT_EQ(AAFRESULT_BADINDEX, multiple->GetFileDescriptorAt(2, found.Out()));
     aafRational_t rate{9, 9};
@@ -310,18 +308,16 @@ TEST_F(Descriptor, OfSeveralKindsKeepsItsPartsInOrder) {
     EXPECT_EQ(AAFRESULT_SUCCESS, multiple->RemoveFileDescriptorAt(0));
     EXPECT_EQ(AAFRESULT_BADINDEX, multiple->RemoveFileDescriptorAt(1));
     EXPECT_EQ(1u, Get(multiple, &IAAFMultipleDescriptor::CountFileDescriptors));
-    Ptr<IEnumAAFFileDescriptors> all;
-    EXPECT_EQ(AAFRESULT_SUCCESS, multiple->GetFileDescriptors(all.Out()));
+    Ptr<IEnumAAFFileDescriptors> all = Get(multiple, &IAAFMultipleDescriptor::GetFileDescriptors);
     EXPECT_EQ(AAFRESULT_SUCCESS, all->NextOne(found.Out()));
     EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->NextOne(found.Out()));
 }
 
 TEST_F(Descriptor, OfAnImportNeedsNoInitializeAndKeepsItsLocators) {
     Ptr<IAAFEssenceDescriptor> import = Make<IAAFEssenceDescriptor>(AUID_AAFImportDescriptor);
-    Ptr<IEnumAAFLocators> all;
     Ptr<IAAFLocator> found;
     EXPECT_EQ(0u, Get(import, &IAAFEssenceDescriptor::CountLocators));
-    ASSERT_EQ(AAFRESULT_SUCCESS, import->GetLocators(all.Out()));
+    Ptr<IEnumAAFLocators> all = Get(import, &IAAFEssenceDescriptor::GetLocators);
     EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->NextOne(found.Out()));
     Ptr<IAAFLocator> first = Make<IAAFLocator>(AUID_AAFNetworkLocator);
     Ptr<IAAFLocator> second = Make<IAAFLocator>(AUID_AAFTextLocator);

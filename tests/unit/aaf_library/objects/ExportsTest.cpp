@@ -95,10 +95,9 @@ TEST(Exports, HaveNoPlugInsToManage) {
 
 TEST(Exports, ListTheKindsOfFilesThatCanBeWritten) {
     Ptr<IEnumAAFFileEncodings> all;
-    Ptr<IAAFFileEncoding> encoding;
     EXPECT_EQ(AAFRESULT_NULL_PARAM, AAFGetFileEncodings(nullptr));
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFGetFileEncodings(all.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(encoding.Out()));
+    Ptr<IAAFFileEncoding> encoding = Get(all, &IEnumAAFFileEncodings::NextOne);
     EXPECT_EQ(kAAFFileKind_Aaf512Binary, Get(encoding, &IAAFFileEncoding::GetFileKind));
     EXPECT_EQ(L"AAF-512", TextOf<IAAFFileEncoding>(encoding, &IAAFFileEncoding::GetNameBufLen,
                                                    &IAAFFileEncoding::GetName));
@@ -142,18 +141,15 @@ TEST(Exports, PinTimeAndGenerationUntilTheyAreFreed) {
         ASSERT_EQ(AAFRESULT_SUCCESS,
                   AAFCliphostPinTime(pinned ? &time : nullptr, pinned ? &generation : nullptr));
         Ptr<IAAFFile> file;
-        Ptr<IAAFHeader> header;
-        Ptr<IAAFDictionary> dictionary;
-        Ptr<IAAFIdentification> last;
         Ptr<IAAFMob> mob;
         aafTimeStamp_t found{};
         aafUID_t id{};
         ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product.ident, file.Out()));
-        ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
-        ASSERT_EQ(AAFRESULT_SUCCESS, file->GetDictionary(dictionary.Out()));
+        Ptr<IAAFHeader> header = Get(file, &IAAFFile::GetHeader);
+        Ptr<IAAFDictionary> dictionary = Get(file, &IAAFFile::GetDictionary);
         EXPECT_EQ(AAFRESULT_SUCCESS, header->GetLastModified(&found));
         EXPECT_EQ(pinned, found.date.year == 2001);
-        ASSERT_EQ(AAFRESULT_SUCCESS, header->GetLastIdentification(last.Out()));
+        Ptr<IAAFIdentification> last = Get(header, &IAAFHeader::GetLastIdentification);
         EXPECT_EQ(AAFRESULT_SUCCESS, last->GetGenerationID(&id));
         EXPECT_EQ(pinned, id == generation);
         EXPECT_EQ(AAFRESULT_SUCCESS, last->GetDate(&found));

@@ -61,11 +61,9 @@ TEST_F(File, HasTheSecondRevision) {
 }
 
 TEST_F(File, GivesTheSameHeaderAndDictionaryEachTime) {
-    Ptr<IAAFHeader> header;
-    Ptr<IAAFDictionary> ofFile;
     Ptr<IAAFDictionary> ofObject;
-    EXPECT_EQ(AAFRESULT_SUCCESS, file_->GetHeader(header.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, file_->GetDictionary(ofFile.Out()));
+    Ptr<IAAFHeader> header = Get(file_, &IAAFFile::GetHeader);
+    Ptr<IAAFDictionary> ofFile = Get(file_, &IAAFFile::GetDictionary);
     EXPECT_EQ(AAFRESULT_SUCCESS, Make<IAAFObject>(AUID_AAFFiller)->GetDictionary(ofObject.Out()));
     EXPECT_EQ(header_.get(), header.get());
     EXPECT_EQ(dictionary_.get(), ofFile.get());
@@ -95,10 +93,8 @@ TEST_F(File, LeavesAMobUsableThatOutlivesEverythingElse) {
 
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L"alone"));
     EXPECT_EQ(0u, Get(mob, &IAAFMob::CountSlots));
-    Ptr<IAAFDictionary> dictionary;
-    Ptr<IAAFDataDef> picture;
-    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(mob)->GetDictionary(dictionary.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, dictionary->LookupDataDef(kAAFDataDef_Picture, picture.Out()));
+    Ptr<IAAFDictionary> dictionary = Get(As<IAAFObject>(mob), &IAAFObject::GetDictionary);
+    Ptr<IAAFDataDef> picture = Get(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Picture);
 }
 
 TEST_F(File, LeavesMobsUsableThatAreHeldWhenItIsClosed) {
@@ -115,8 +111,7 @@ TEST_F(File, KeepsAMobThatItsMakerLetGo) {
         mob->SetName(L"kept");
         ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
     }
-    Ptr<IAAFMob> found;
-    ASSERT_EQ(AAFRESULT_SUCCESS, header_->LookupMob(MobId(1), found.Out()));
+    Ptr<IAAFMob> found = Get(header_, &IAAFHeader::LookupMob, MobId(1));
     EXPECT_EQ(L"kept", TextOf<IAAFMob>(found, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
 }
 

@@ -53,8 +53,7 @@ TEST_F(Header, TellsTheByteOrder) {
 
 TEST_F(Header, HasItsRequiredProperties) {
     Ptr<IAAFObject> object = As<IAAFObject>(header_);
-    Ptr<IAAFClassDef> definition;
-    ASSERT_EQ(AAFRESULT_SUCCESS, object->GetDefinition(definition.Out()));
+    Ptr<IAAFClassDef> definition = Get(object, &IAAFObject::GetDefinition);
     const aafUID_t ids[] = {ncfGuid("03010201-0200-0000-060E-2B3401010101"),
                             ncfGuid("07020110-0204-0000-060E-2B3401010102"),
                             ncfGuid("06010104-0201-0000-060E-2B3401010102"),
@@ -62,9 +61,8 @@ TEST_F(Header, HasItsRequiredProperties) {
                             ncfGuid("06010104-0604-0000-060E-2B3401010102"),
                             ncfGuid("03010201-0400-0000-060E-2B3401010102")};
     for (const aafUID_t& id : ids) {
-        Ptr<IAAFPropertyDef> property;
         aafBoolean_t present = kAAFFalse;
-        ASSERT_EQ(AAFRESULT_SUCCESS, definition->LookupPropertyDef(id, property.Out()));
+        Ptr<IAAFPropertyDef> property = Get(definition, &IAAFClassDef::LookupPropertyDef, id);
         EXPECT_EQ(AAFRESULT_SUCCESS, object->IsPropertyPresent(property, &present));
         EXPECT_EQ(kAAFTrue, present);
     }
@@ -80,9 +78,8 @@ TEST_F(Header, AddsAMobOnce) {
 
 TEST_F(Header, RefusesAMobOfAnotherFile) {
     Ptr<IAAFFile> other;
-    Ptr<IAAFHeader> otherHeader;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, other.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, other->GetHeader(otherHeader.Out()));
+    Ptr<IAAFHeader> otherHeader = Get(other, &IAAFFile::GetHeader);
     Ptr<IAAFMob> mob = FileMob(1);
     ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, otherHeader->AddMob(mob));
@@ -99,8 +96,7 @@ TEST_F(Header, TakesARemovedMobBack) {
 
 TEST_F(Header, FindsMobsByIdOnly) {
     ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(FileMob(3)));
-    Ptr<IAAFMob> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, header_->LookupMob(MobId(3), found.Out()));
+    Ptr<IAAFMob> found = Get(header_, &IAAFHeader::LookupMob, MobId(3));
     IAAFMob* untouched = found;
     EXPECT_EQ(AAFRESULT_MOB_NOT_FOUND, header_->LookupMob(MobId(4), &untouched));
     EXPECT_EQ(found.get(), untouched);
@@ -111,8 +107,7 @@ TEST_F(Header, GivesMobsInTheOrderOfTheirIds) {
     for (aafUInt8 number : {5, 0xF0, 1, 0x80}) {
         ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(FileMob(number)));
     }
-    Ptr<IEnumAAFMobs> mobs;
-    ASSERT_EQ(AAFRESULT_SUCCESS, header_->GetMobs(nullptr, mobs.Out()));
+    Ptr<IEnumAAFMobs> mobs = Get(header_, &IAAFHeader::GetMobs, nullptr);
     EXPECT_EQ((std::vector<aafUInt8>{1, 5, 0x80, 0xF0}), Order(mobs));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, header_->GetMobs(nullptr, nullptr));
 }
@@ -125,11 +120,9 @@ TEST_F(Header, EntersAMobAnewWhenItsIdChanges) {
     EXPECT_EQ(AAFRESULT_DUPLICATE_MOBID, first->SetMobID(MobId(1)));
     EXPECT_EQ(AAFRESULT_SUCCESS, first->SetMobID(MobId(9)));
 
-    Ptr<IEnumAAFMobs> mobs;
-    Ptr<IAAFMob> found;
-    ASSERT_EQ(AAFRESULT_SUCCESS, header_->GetMobs(nullptr, mobs.Out()));
+    Ptr<IEnumAAFMobs> mobs = Get(header_, &IAAFHeader::GetMobs, nullptr);
     EXPECT_EQ((std::vector<aafUInt8>{5, 9}), Order(mobs));
-    EXPECT_EQ(AAFRESULT_SUCCESS, header_->LookupMob(MobId(9), found.Out()));
+    Ptr<IAAFMob> found = Get(header_, &IAAFHeader::LookupMob, MobId(9));
     EXPECT_EQ(first.get(), found.get());
     EXPECT_EQ(AAFRESULT_MOB_NOT_FOUND, header_->LookupMob(MobId(1), found.Out()));
 }
@@ -185,8 +178,7 @@ TEST_F(Header, SearchesMobsByCriterion) {
         aafSearchCrit_t criterion{};
         criterion.searchTag = tag;
         set(criterion.tags);
-        Ptr<IEnumAAFMobs> mobs;
-        EXPECT_EQ(AAFRESULT_SUCCESS, header_->GetMobs(&criterion, mobs.Out()));
+        Ptr<IEnumAAFMobs> mobs = Get(header_, &IAAFHeader::GetMobs, &criterion);
         return Order(mobs);
     };
     using Numbers = std::vector<aafUInt8>;
@@ -224,8 +216,7 @@ TEST_F(Header, RefusesCriteriaThatItDoesNotKnow) {
 }
 
 TEST_F(Header, TellsWhoWroteTheFile) {
-    Ptr<IAAFIdentification> last;
-    ASSERT_EQ(AAFRESULT_SUCCESS, header_->GetLastIdentification(last.Out()));
+    Ptr<IAAFIdentification> last = Get(header_, &IAAFHeader::GetLastIdentification);
     EXPECT_EQ(L"Cliphost",
               TextOf<IAAFIdentification>(last, &IAAFIdentification::GetCompanyNameBufLen,
                                          &IAAFIdentification::GetCompanyName));
@@ -253,15 +244,13 @@ TEST_F(Header, TellsWhoWroteTheFile) {
     EXPECT_EQ(6, version.tertiary);
     EXPECT_EQ(AAFRESULT_SUCCESS, last->GetGenerationID(&generation));
 
-    Ptr<IAAFIdentification> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, header_->LookupIdentification(generation, found.Out()));
+    Ptr<IAAFIdentification> found = Get(header_, &IAAFHeader::LookupIdentification, generation);
     EXPECT_EQ(last.get(), found.get());
     EXPECT_EQ(AAFRESULT_OBJECT_NOT_FOUND, header_->LookupIdentification(product, found.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->GetIdentificationAt(0, found.Out()));
     EXPECT_EQ(last.get(), found.get());
     EXPECT_EQ(AAFRESULT_BADINDEX, header_->GetIdentificationAt(1, found.Out()));
-    Ptr<IEnumAAFIdentifications> all;
-    EXPECT_EQ(AAFRESULT_SUCCESS, header_->GetIdentifications(all.Out()));
+    Ptr<IEnumAAFIdentifications> all = Get(header_, &IAAFHeader::GetIdentifications);
     EXPECT_EQ(AAFRESULT_SUCCESS, all->NextOne(found.Out()));
     EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->NextOne(found.Out()));
 }
@@ -272,11 +261,9 @@ TEST_F(Header, DoesWithoutTheOptionalPartsOfAnIdentification) {
     product.ident.productVersionString = nullptr;
     product.ident.platform = nullptr;
     Ptr<IAAFFile> file;
-    Ptr<IAAFHeader> header;
-    Ptr<IAAFIdentification> last;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product.ident, file.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, header->GetLastIdentification(last.Out()));
+    Ptr<IAAFHeader> header = Get(file, &IAAFFile::GetHeader);
+    Ptr<IAAFIdentification> last = Get(header, &IAAFHeader::GetLastIdentification);
     aafProductVersion_t version{};
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, last->GetProductVersion(&version));
     EXPECT_EQ(L"Unknown version",
@@ -295,8 +282,7 @@ TEST_F(Header, KeepsIdentificationsThatAreAppended) {
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->AppendIdentification(next));
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, header_->AppendIdentification(next));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, header_->AppendIdentification(nullptr));
-    Ptr<IAAFIdentification> last;
-    EXPECT_EQ(AAFRESULT_SUCCESS, header_->GetLastIdentification(last.Out()));
+    Ptr<IAAFIdentification> last = Get(header_, &IAAFHeader::GetLastIdentification);
     EXPECT_EQ(next.get(), last.get());
 }
 
@@ -320,16 +306,14 @@ TEST_F(Header, KeepsEssenceUnderTheIdOfItsFileMob) {
     EXPECT_EQ(3, Get(data, &IAAFEssenceData::GetSize));
 
     aafBoolean_t present = kAAFFalse;
-    Ptr<IAAFEssenceData> found;
-    Ptr<IAAFSourceMob> back2;
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->IsEssenceDataPresent(MobId(1), kAAFEssence, &present));
     EXPECT_EQ(kAAFTrue, present);
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->IsEssenceDataPresent(MobId(2), kAAFEssence, &present));
     EXPECT_EQ(kAAFFalse, present);
     EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, header_->IsEssenceDataPresent(MobId(1), 2, &present));
-    EXPECT_EQ(AAFRESULT_SUCCESS, header_->LookupEssenceData(MobId(1), found.Out()));
+    Ptr<IAAFEssenceData> found = Get(header_, &IAAFHeader::LookupEssenceData, MobId(1));
     EXPECT_EQ(data.get(), found.get());
-    EXPECT_EQ(AAFRESULT_SUCCESS, data->GetFileMob(back2.Out()));
+    Ptr<IAAFSourceMob> back2 = Get(data, &IAAFEssenceData::GetFileMob);
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->RemoveEssenceData(data));
     EXPECT_EQ(AAFRESULT_ESSENCE_NOT_FOUND, header_->RemoveEssenceData(data));
     EXPECT_EQ(AAFRESULT_ESSENCE_NOT_FOUND, header_->LookupEssenceData(MobId(1), found.Out()));
@@ -337,9 +321,8 @@ TEST_F(Header, KeepsEssenceUnderTheIdOfItsFileMob) {
 
 TEST_F(Header, AnswersWithAFailureWhenItsContentWasRemoved) {
     Ptr<IAAFObject> object = As<IAAFObject>(header_);
-    Ptr<IAAFClassDef> definition;
     Ptr<IAAFPropertyDef> content;
-    ASSERT_EQ(AAFRESULT_SUCCESS, object->GetDefinition(definition.Out()));
+    Ptr<IAAFClassDef> definition = Get(object, &IAAFObject::GetDefinition);
     ASSERT_EQ(AAFRESULT_SUCCESS,
               definition->LookupPropertyDef(ncfGuid("06010104-0201-0000-060E-2B3401010102"),
                                             content.Out()));
@@ -354,8 +337,7 @@ TEST_F(Header, AnswersWithAFailureWhenItsContentWasRemoved) {
 }
 
 TEST_F(Header, SharesItsContentWithTheContentStorage) {
-    Ptr<IAAFContentStorage> storage;
-    ASSERT_EQ(AAFRESULT_SUCCESS, header_->GetContentStorage(storage.Out()));
+    Ptr<IAAFContentStorage> storage = Get(header_, &IAAFHeader::GetContentStorage);
     ASSERT_EQ(AAFRESULT_SUCCESS, storage->AddMob(FileMob(1)));
     aafNumSlots_t count = 0;
     EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFFileMob, &count));

@@ -168,8 +168,7 @@ TEST_F(Mob, FindsTheFirstSlotWithAnId) {
                                                             L"", 0, first.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(Clip(1)), 4,
                                                             L"", 0, second.Out()));
-    Ptr<IAAFMobSlot> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(4, found.Out()));
+    Ptr<IAAFMobSlot> found = Get(mob, &IAAFMob::LookupSlot, 4);
     EXPECT_EQ(As<IAAFMobSlot>(first).get(), found.get());
     IAAFMobSlot* out = found;
     EXPECT_EQ(AAFRESULT_SLOT_NOT_FOUND, mob->LookupSlot(5, &out));
@@ -210,18 +209,14 @@ TEST_F(Mob, FindsSlotsByTheIdsThatTheyHaveNow) {
     EXPECT_EQ(third.get(), found(3).get());
 
     // By the value that stands in the slot, and by another one in its stead.
-    Ptr<IAAFClassDef> slots;
-    Ptr<IAAFPropertyDef> property;
-    Ptr<IAAFTypeDef> type;
-    Ptr<IAAFPropertyValue> value;
-    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupClassDef(AUID_AAFMobSlot, slots.Out()));
+    Ptr<IAAFClassDef> slots = Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFMobSlot);
     const aafUID_t slotId = ncfGuid("01070101-0000-0000-060E-2B3401010102");
-    ASSERT_EQ(AAFRESULT_SUCCESS, slots->LookupPropertyDef(slotId, property.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(kAAFTypeID_UInt32, type.Out()));
+    Ptr<IAAFPropertyDef> property = Get(slots, &IAAFClassDef::LookupPropertyDef, slotId);
+    Ptr<IAAFTypeDef> type = Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_UInt32);
     const Ptr<IAAFTypeDefInt> integers = As<IAAFTypeDefInt>(type);
     const Ptr<IAAFObject> object = As<IAAFObject>(first);
     aafUInt32 number = 7;
-    ASSERT_EQ(AAFRESULT_SUCCESS, object->GetPropertyValue(property, value.Out()));
+    Ptr<IAAFPropertyValue> value = Get(object, &IAAFObject::GetPropertyValue, property);
     ASSERT_EQ(AAFRESULT_SUCCESS,
               integers->SetInteger(value, reinterpret_cast<aafMemPtr_t>(&number), sizeof number));
     EXPECT_EQ(first.get(), found(7).get());
@@ -243,8 +238,7 @@ TEST_F(Mob, TakesAndFindsManySlotsInGoodTime) {
     const auto start = std::chrono::steady_clock::now();
     for (aafSlotID_t id = 1; id <= kSlots; ++id) {
         ASSERT_EQ(AAFRESULT_SUCCESS, source->AddNilReference(id, 10, sound, {25, 1}));
-        Ptr<IAAFMobSlot> slot;
-        ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(id, slot.Out()));
+        Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, id);
         ASSERT_EQ(AAFRESULT_SUCCESS, slot->SetName(L""));
     }
     // Looking through all slots each time takes more than a minute.
@@ -265,8 +259,7 @@ TEST_F(Mob, KeepsSlotsInOrderAndFreesRemovedOnes) {
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->InsertSlotAt(1, slots[1]));
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, mob->AppendSlot(slots[1]));
     for (aafUInt32 at = 0; at < 3; ++at) {
-        Ptr<IAAFMobSlot> slot;
-        EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetSlotAt(at, slot.Out()));
+        Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::GetSlotAt, at);
         EXPECT_EQ(slots[at].get(), slot.get());
     }
     Ptr<IAAFMobSlot> none;
@@ -278,10 +271,9 @@ TEST_F(Mob, KeepsSlotsInOrderAndFreesRemovedOnes) {
 
 TEST_F(Mob, EnumeratesItsLiveListOfSlots) {
     Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
-    Ptr<IEnumAAFMobSlots> slots;
     Ptr<IAAFMobSlot> slot;
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->GetSlots(nullptr));
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetSlots(slots.Out()));
+    Ptr<IEnumAAFMobSlots> slots = Get(mob, &IAAFMob::GetSlots);
     EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, slots->NextOne(slot.Out()));
     mob->AppendSlot(Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot));
     EXPECT_EQ(AAFRESULT_SUCCESS, slots->NextOne(slot.Out()));
@@ -315,15 +307,11 @@ TEST_F(Mob, StoresACommentAsATextWithItsEnd) {
     Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
     wchar_t name[] = L"name";
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(name, L"abc"));
-    Ptr<IEnumAAFTaggedValues> all;
-    Ptr<IAAFTaggedValue> value;
-    Ptr<IAAFTypeDef> type;
-    Ptr<IAAFTypeDef> text;
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetComments(all.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
+    Ptr<IEnumAAFTaggedValues> all = Get(mob, &IAAFMob::GetComments);
+    Ptr<IAAFTaggedValue> value = Get(all, &IEnumAAFTaggedValues::NextOne);
     EXPECT_EQ(4 * sizeof(aafCharacter), Get(value, &IAAFTaggedValue::GetValueBufLen));
-    EXPECT_EQ(AAFRESULT_SUCCESS, value->GetTypeDefinition(type.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(kAAFTypeID_String, text.Out()));
+    Ptr<IAAFTypeDef> type = Get(value, &IAAFTaggedValue::GetTypeDefinition);
+    Ptr<IAAFTypeDef> text = Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_String);
     EXPECT_EQ(text.get(), type.get());
 }
 
@@ -335,10 +323,8 @@ TEST_F(Mob, RemovesComments) {
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendComment(name, L"abc"));
     EXPECT_EQ(AAFRESULT_OBJECT_NOT_ATTACHED, mob->RemoveComment(foreign));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->RemoveComment(nullptr));
-    Ptr<IEnumAAFTaggedValues> all;
-    Ptr<IAAFTaggedValue> value;
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->GetComments(all.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, all->NextOne(value.Out()));
+    Ptr<IEnumAAFTaggedValues> all = Get(mob, &IAAFMob::GetComments);
+    Ptr<IAAFTaggedValue> value = Get(all, &IEnumAAFTaggedValues::NextOne);
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->RemoveComment(value));
     EXPECT_EQ(0u, Get(mob, &IAAFMob::CountComments));
 }
@@ -386,8 +372,7 @@ TEST_F(Mob, ChangesReferencesInAllThatItHolds) {
 TEST_F(Mob, CopiesItselfIntoItsFileUnderAFreshId) {
     Ptr<IAAFMob> mob = FileMob(1);
     ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
-    Ptr<IAAFMob> copy;
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->Copy(L"twin", copy.Out()));
+    Ptr<IAAFMob> copy = Get(mob, &IAAFMob::Copy, L"twin");
     aafMobID_t id{};
     aafNumSlots_t mobs = 0;
     EXPECT_EQ(AAFRESULT_SUCCESS, copy->GetMobID(&id));

@@ -54,60 +54,48 @@ TEST_F(SaveCopy, WritesAFileThatReadsBackWhole) {
     const std::wstring path = Path("clip.aaf");
     Copy(path);
     Ptr<IAAFFile> read;
-    Ptr<IAAFHeader> header;
-    Ptr<IAAFDictionary> dictionary;
-    Ptr<IAAFMob> master;
-    Ptr<IAAFMob> fileMob;
-    Ptr<IAAFMob> source;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, read.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, read->GetHeader(header.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, read->GetDictionary(dictionary.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0x01), master.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0xB1), fileMob.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(0xA1), source.Out()));
+    Ptr<IAAFHeader> header = Get(read, &IAAFFile::GetHeader);
+    Ptr<IAAFDictionary> dictionary = Get(read, &IAAFFile::GetDictionary);
+    Ptr<IAAFMob> master = Get(header, &IAAFHeader::LookupMob, MobId(0x01));
+    Ptr<IAAFMob> fileMob = Get(header, &IAAFHeader::LookupMob, MobId(0xB1));
+    Ptr<IAAFMob> source = Get(header, &IAAFHeader::LookupMob, MobId(0xA1));
     EXPECT_EQ(L"A001", TextOf<IAAFMob>(master, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
     EXPECT_EQ(Comments(master_), Comments(master));
 
     EXPECT_EQ(5u, Get(source, &IAAFMob::CountSlots));
     EXPECT_EQ(3u, Get(fileMob, &IAAFMob::CountSlots));
 
-    Ptr<IAAFMobSlot> slot;
-    Ptr<IAAFSegment> segment;
-    Ptr<IAAFMob> resolved;
     aafSourceRef_t reference{};
-    ASSERT_EQ(AAFRESULT_SUCCESS, fileMob->LookupSlot(3, slot.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFMobSlot> slot = Get(fileMob, &IAAFMob::LookupSlot, 3);
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     Ptr<IAAFSourceClip> clip = As<IAAFSourceClip>(segment);
     EXPECT_EQ(AAFRESULT_SUCCESS, clip->GetSourceReference(&reference));
     EXPECT_EQ(1000, reference.startTime);
-    EXPECT_EQ(AAFRESULT_SUCCESS, clip->ResolveRef(resolved.Out()));
+    Ptr<IAAFMob> resolved = Get(clip, &IAAFSourceClip::ResolveRef);
     EXPECT_EQ(source.get(), resolved.get());
 
-    Ptr<IAAFEssenceDescriptor> essence;
-    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceMob>(fileMob)->GetEssenceDescriptor(essence.Out()));
+    Ptr<IAAFEssenceDescriptor> essence =
+        Get(As<IAAFSourceMob>(fileMob), &IAAFSourceMob::GetEssenceDescriptor);
     Ptr<IAAFMultipleDescriptor> multiple = As<IAAFMultipleDescriptor>(essence);
-    Ptr<IAAFFileDescriptor> part;
-    Ptr<IAAFContainerDef> container;
-    Ptr<IAAFLocator> locator;
-    ASSERT_EQ(AAFRESULT_SUCCESS, multiple->GetFileDescriptorAt(0, part.Out()));
-    EXPECT_EQ(AAFRESULT_SUCCESS, part->GetContainerFormat(container.Out()));
+    Ptr<IAAFFileDescriptor> part = Get(multiple, &IAAFMultipleDescriptor::GetFileDescriptorAt, 0);
+    Ptr<IAAFContainerDef> container = Get(part, &IAAFFileDescriptor::GetContainerFormat);
     EXPECT_EQ(10, Get(As<IAAFCDCIDescriptor>(part), &IAAFCDCIDescriptor::GetComponentWidth));
-    ASSERT_EQ(AAFRESULT_SUCCESS, essence->GetLocatorAt(0, locator.Out()));
+    Ptr<IAAFLocator> locator = Get(essence, &IAAFEssenceDescriptor::GetLocatorAt, 0);
     EXPECT_EQ(L"file:///media/A001.mov",
               TextOf<IAAFLocator>(locator, &IAAFLocator::GetPathBufLen, &IAAFLocator::GetPath));
 
     // The extensions came along.
     Ptr<IAAFClassDef> pictures;
     Ptr<IAAFPropertyDef> property;
-    Ptr<IAAFPropertyValue> value;
-    Ptr<IAAFTypeDef> type;
     ASSERT_EQ(AAFRESULT_SUCCESS,
               dictionary->LookupClassDef(AUID_AAFCDCIDescriptor, pictures.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS,
               pictures->LookupPropertyDef(ncfGuid("0E040101-0101-010E-060E-2B3401010101"),
                                           property.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(part)->GetPropertyValue(property, value.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, value->GetType(type.Out()));
+    Ptr<IAAFPropertyValue> value =
+        Get(As<IAAFObject>(part), &IAAFObject::GetPropertyValue, property);
+    Ptr<IAAFTypeDef> type = Get(value, &IAAFPropertyValue::GetType);
     aafInt32 slices = 0;
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTypeDefInt>(type)->GetInteger(
                                      value, reinterpret_cast<aafMemPtr_t>(&slices), 4));
@@ -119,18 +107,15 @@ TEST_F(SaveCopy, WritesAFileThatReadsBackWhole) {
 }
 
 TEST_F(SaveCopy, CarriesExtensionsThatNothingUses) {
-    Ptr<IAAFClassDef> mobs;
-    Ptr<IAAFTypeDef> type;
     Ptr<IAAFPropertyDef> property;
     const aafUID_t id = ncfGuid("ABCDEF00-0000-0000-0000-000000000004");
-    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupClassDef(AUID_AAFMob, mobs.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(kAAFTypeID_Int32, type.Out()));
+    Ptr<IAAFClassDef> mobs = Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFMob);
+    Ptr<IAAFTypeDef> type = Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Int32);
     ASSERT_EQ(AAFRESULT_SUCCESS,
               mobs->RegisterOptionalPropertyDef(id, L"Idle", type, property.Out()));
     Ptr<IAAFFile> target = NewFile(Path("idle.aaf"));
     ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target));
-    Ptr<IAAFDictionary> dictionary;
-    ASSERT_EQ(AAFRESULT_SUCCESS, target->GetDictionary(dictionary.Out()));
+    Ptr<IAAFDictionary> dictionary = Get(target, &IAAFFile::GetDictionary);
     ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->LookupClassDef(AUID_AAFMob, mobs.Out()));
     EXPECT_EQ(AAFRESULT_SUCCESS, mobs->LookupPropertyDef(id, property.Out()));
     EXPECT_EQ(kAAFTrue, Get(property, &IAAFPropertyDef::GetIsOptional));
@@ -225,22 +210,18 @@ TEST_F(SaveCopy, ChangesAnExistingFileAndSaysWho) {
     Copy(path);
     {
         Ptr<IAAFFile> file;
-        Ptr<IAAFHeader> header;
-        Ptr<IAAFMob> mob;
         ASSERT_EQ(AAFRESULT_SUCCESS,
                   AAFFileOpenExistingModify(path.c_str(), 0, &product_.ident, file.Out()));
-        ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
-        ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(1), mob.Out()));
+        Ptr<IAAFHeader> header = Get(file, &IAAFFile::GetHeader);
+        Ptr<IAAFMob> mob = Get(header, &IAAFHeader::LookupMob, MobId(1));
         EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L"changed"));
         EXPECT_EQ(AAFRESULT_SUCCESS, file->Save());
     }
     Ptr<IAAFFile> file;
-    Ptr<IAAFHeader> header;
-    Ptr<IAAFMob> mob;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, file.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
+    Ptr<IAAFHeader> header = Get(file, &IAAFFile::GetHeader);
     EXPECT_EQ(2u, Get(header, &IAAFHeader::CountIdentifications));
-    ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupMob(MobId(1), mob.Out()));
+    Ptr<IAAFMob> mob = Get(header, &IAAFHeader::LookupMob, MobId(1));
     EXPECT_EQ(L"changed", TextOf<IAAFMob>(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
 }
 
@@ -261,7 +242,6 @@ TEST_F(SaveCopy, ClonesSingleMobsWithThoseTheyReferTo) {
     DescribeClip();
     Ptr<IAAFFile> alone = NewFile(Path("alone.aaf"));
     Ptr<IAAFFile> all = NewFile(Path("all.aaf"));
-    Ptr<IAAFHeader> header;
     Ptr<IAAFMob> clone;
     aafNumSlots_t count = 0;
     EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, master_->CloneExternal(2, 0, alone, clone.Out()));
@@ -269,7 +249,7 @@ TEST_F(SaveCopy, ClonesSingleMobsWithThoseTheyReferTo) {
     ASSERT_EQ(AAFRESULT_SUCCESS,
               master_->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, alone, clone.Out()));
     EXPECT_EQ(Comments(master_), Comments(clone));
-    ASSERT_EQ(AAFRESULT_SUCCESS, alone->GetHeader(header.Out()));
+    Ptr<IAAFHeader> header = Get(alone, &IAAFFile::GetHeader);
     EXPECT_EQ(AAFRESULT_SUCCESS, header->CountMobs(kAAFAllMob, &count));
     EXPECT_EQ(1u, count);
     EXPECT_EQ(AAFRESULT_DUPLICATE_MOBID,
@@ -294,9 +274,8 @@ TEST_F(SaveCopy, CarriesEssence) {
     const std::wstring path = Path("essence.aaf");
     Copy(path);
     Ptr<IAAFFile> read;
-    Ptr<IAAFHeader> header;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, read.Out()));
-    ASSERT_EQ(AAFRESULT_SUCCESS, read->GetHeader(header.Out()));
+    Ptr<IAAFHeader> header = Get(read, &IAAFFile::GetHeader);
     ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupEssenceData(MobId(1), data.Out()));
     EXPECT_EQ(100000, Get(data, &IAAFEssenceData::GetSize));
 }

@@ -61,11 +61,9 @@ TEST_F(Slot, GivesTheStoredSegmentItself) {
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, slot->SetSegment(segment));
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED,
               Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot)->SetSegment(segment));
-    Ptr<IAAFSegment> found;
-    Ptr<IAAFDataDef> dataDef;
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(found.Out()));
+    Ptr<IAAFSegment> found = Get(slot, &IAAFMobSlot::GetSegment);
     EXPECT_EQ(segment.get(), found.get());
-    EXPECT_EQ(AAFRESULT_SUCCESS, slot->GetDataDef(dataDef.Out()));
+    Ptr<IAAFDataDef> dataDef = Get(slot, &IAAFMobSlot::GetDataDef);
     EXPECT_EQ(DataDef(kAAFDataDef_LegacyPicture).get(), dataDef.get());
     ASSERT_EQ(AAFRESULT_SUCCESS, slot->SetSegment(As<IAAFSegment>(Clip(6))));
     EXPECT_EQ(AAFRESULT_SUCCESS, Make<IAAFMobSlot>(AUID_AAFTimelineMobSlot)->SetSegment(segment));
@@ -87,8 +85,7 @@ TEST_F(Slot, HasMarksThatAreAbsentAtFirst) {
 
 TEST_F(SourceMob, HasNoDescriptorAtFirst) {
     Ptr<IAAFSourceMob> mob = Make<IAAFSourceMob>(AUID_AAFSourceMob);
-    Ptr<IAAFEssenceDescriptor> descriptor;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetEssenceDescriptor(descriptor.Out()));
+    Ptr<IAAFEssenceDescriptor> descriptor = Get(mob, &IAAFSourceMob::GetEssenceDescriptor);
     EXPECT_EQ(nullptr, descriptor.get());
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->GetEssenceDescriptor(nullptr));
 }
@@ -104,8 +101,7 @@ TEST_F(SourceMob, ReplacesItsDescriptorAndFreesTheOldOne) {
     EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED, other->SetEssenceDescriptor(first));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetEssenceDescriptor(second));
     EXPECT_EQ(AAFRESULT_SUCCESS, other->SetEssenceDescriptor(first));
-    Ptr<IAAFEssenceDescriptor> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetEssenceDescriptor(found.Out()));
+    Ptr<IAAFEssenceDescriptor> found = Get(mob, &IAAFSourceMob::GetEssenceDescriptor);
     EXPECT_EQ(second.get(), found.get());
 }
 
@@ -119,12 +115,10 @@ TEST_F(SourceMob, AppendsNilReferencesAlsoUnderOneId) {
     EXPECT_EQ(AAFRESULT_SUCCESS, source->AddNilReference(1, -5, sound, {25, 1}));
     EXPECT_EQ(2u, Get(mob, &IAAFMob::CountSlots));
 
-    Ptr<IAAFMobSlot> slot;
-    Ptr<IAAFSegment> segment;
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(1, slot.Out()));
+    Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, 1);
     EXPECT_EQ(L"Test", NameOf(slot));
     EXPECT_EQ(0, Get(As<IAAFTimelineMobSlot>(slot), &IAAFTimelineMobSlot::GetOrigin));
-    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     aafSourceRef_t reference{MobId(1), 1, 1};
     aafLength_t length = 0;
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&reference));
@@ -145,19 +139,17 @@ TEST_F(SourceMob, PutsNewReferencesIntoSlotsOldOrNew) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, source->NewPhysSourceRef({25, 1}, 7, nullptr, reference, 10));
     // The rate is not checked and the target need not exist.
     EXPECT_EQ(AAFRESULT_SUCCESS, source->NewPhysSourceRef({30, 0}, 7, picture, reference, 10));
-    Ptr<IAAFMobSlot> slot;
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(7, slot.Out()));
+    Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, 7);
     EXPECT_EQ(L"ASlot", NameOf(slot));
     slot->SetName(L"mine");
 
     EXPECT_EQ(AAFRESULT_SUCCESS, source->NewPhysSourceRef({25, 1}, 7, picture, reference, 20));
     aafRational_t rate{};
-    Ptr<IAAFSegment> segment;
     EXPECT_EQ(1u, Get(mob, &IAAFMob::CountSlots));
     EXPECT_EQ(L"mine", NameOf(slot));
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTimelineMobSlot>(slot)->GetEditRate(&rate));
     EXPECT_EQ(30, rate.numerator);
-    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     EXPECT_EQ(20, Get(As<IAAFComponent>(segment), &IAAFComponent::GetLength));
     aafSourceRef_t found{};
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&found));
@@ -205,13 +197,11 @@ TEST_F(SourceMob, AppendsSlotsOfTimecodeAndEdgecode) {
               source->AppendEdgecodeSlot({24, 1}, 2, 5, 100, kAAFFt35MM, kAAFEtKeycode, header));
     EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE,
               source->AppendEdgecodeSlot({24, 1}, 2, 5, 100, 5, kAAFEtKeycode, header));
-    Ptr<IAAFMobSlot> slot;
-    Ptr<IAAFSegment> segment;
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(1, slot.Out()));
+    Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, 1);
     EXPECT_EQ(L"Timecode", NameOf(slot));
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(2, slot.Out()));
     EXPECT_EQ(L"Edgecode", NameOf(slot));
-    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     aafEdgecode_t code{};
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFEdgecode>(segment)->GetEdgecode(&code));
     EXPECT_EQ(5, code.startFrame);
@@ -228,12 +218,10 @@ TEST_F(SourceMob, IsReachedFromAMasterMob) {
               master->AddMasterSlot(picture, 2, As<IAAFSourceMob>(file), 5, L"V1"));
     ASSERT_EQ(AAFRESULT_SUCCESS,
               master->AddMasterSlot(picture, 1, As<IAAFSourceMob>(file), 5, L"V1"));
-    Ptr<IAAFMobSlot> slot;
-    Ptr<IAAFSegment> segment;
     Ptr<IAAFMob> found;
-    ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(5, slot.Out()));
+    Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, 5);
     EXPECT_EQ(L"V1", NameOf(slot));
-    ASSERT_EQ(AAFRESULT_SUCCESS, slot->GetSegment(segment.Out()));
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     Ptr<IAAFSourceClip> clip = As<IAAFSourceClip>(segment);
     EXPECT_EQ(AAFRESULT_OBJECT_NOT_ATTACHED, clip->ResolveRef(found.Out()));
     ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));

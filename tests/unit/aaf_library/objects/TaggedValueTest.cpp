@@ -8,8 +8,7 @@ namespace aaf_test {
 class TaggedValue : public TransientFile {
 protected:
     Ptr<IAAFTypeDef> Type(const aafUID_t& id) {
-        Ptr<IAAFTypeDef> type;
-        EXPECT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupTypeDef(id, type.Out()));
+        Ptr<IAAFTypeDef> type = Get(dictionary_, &IAAFDictionary::LookupTypeDef, id);
         return type;
     }
     Ptr<IAAFTaggedValue> value_ = Make<IAAFTaggedValue>(AUID_AAFTaggedValue);

@@ -30,8 +30,7 @@ TransientFile::~TransientFile() {
 }
 
 Ptr<IAAFDataDef> TransientFile::DataDef(const aafUID_t& id) {
-    Ptr<IAAFDataDef> found;
-    EXPECT_EQ(AAFRESULT_SUCCESS, dictionary_->LookupDataDef(id, found.Out()));
+    Ptr<IAAFDataDef> found = Get(dictionary_, &IAAFDictionary::LookupDataDef, id);
     return found;
 }
 

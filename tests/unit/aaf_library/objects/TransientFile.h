@@ -101,6 +101,27 @@ Ptr<To> As(const Ptr<From>& from) {
     return As<To>(from.get());
 }
 
+// What an operation gives whose last argument is an interface output, after at
+// most one other argument. A failure throws, and so fails the test.
+template <class Object, class Interface, class T>
+Ptr<T> Get(const Object& object, HRESULT (Interface::*operation)(T**)) {
+    Ptr<T> got;
+    if (const HRESULT result = ((*object).*operation)(got.Out()); result != AAFRESULT_SUCCESS) {
+        throw result;
+    }
+    return got;
+}
+template <class Object, class Interface, class Given, class T, class Argument>
+Ptr<T> Get(const Object& object, HRESULT (Interface::*operation)(Given, T**),
+           const Argument& argument) {
+    Ptr<T> got;
+    if (const HRESULT result = ((*object).*operation)(argument, got.Out());
+        result != AAFRESULT_SUCCESS) {
+        throw result;
+    }
+    return got;
+}
+
 // A product identification whose texts live as long as it does.
 struct Product {
     Product();

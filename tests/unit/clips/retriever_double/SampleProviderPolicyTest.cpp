@@ -289,8 +289,7 @@ TEST_F(SampleProviderPolicy, TellsTheUserOfAForcedPicture) {
     EXPECT_EQ(MovieRequiresSampleProviderForVideo(TheConsole(), clip, &info), 0);
     EXPECT_EQ(Console(2, "Forcing sample provider mode for video.\n"), 1);
     EXPECT_TRUE(
-        log->once("MovieRequiresSampleProviderForVideoForcing sample provider mode for "
-                  "video!"));
+        log->once("MovieRequiresSampleProviderForVideoForcing sample provider mode for video!"));
 }
 
 TEST_F(SampleProviderPolicy, TellsTheUserOfForcedSound) {

@@ -285,38 +285,32 @@ TEST_F(AttributeTexts, NumberWithoutTextIsUnexpected) {
 }
 
 TEST_F(AttributeTexts, EveryNumberIsLoggedUnderItsOwnExpression) {
-    const std::pair<const char*, const char*> parts[] = {
-        {"PositionX", "_GetDenominator(positionXNode,&op_box->positionX.denominator)"},
-        {"PositionY", "_GetDenominator(positionYNode,&op_box->positionY.denominator)"},
-        {"Height", "_GetDenominator(heightNode, &op_box->height.denominator)"},
-        {"Width", "_GetDenominator(widthNode, &op_box->width.denominator)"},
+    const struct {
+        const char* part;
+        const char* number;
+        const char* expression;
+    } rows[] = {
+        {"PositionX", "Denominator",
+         "_GetDenominator(positionXNode,&op_box->positionX.denominator)"},
+        {"PositionY", "Denominator",
+         "_GetDenominator(positionYNode,&op_box->positionY.denominator)"},
+        {"Height", "Denominator", "_GetDenominator(heightNode, &op_box->height.denominator)"},
+        {"Width", "Denominator", "_GetDenominator(widthNode, &op_box->width.denominator)"},
+        {"PositionY", "Numerator", "_GetNumerator(positionYNode,&op_box->positionY.numerator)"},
+        {"Height", "Numerator", "_GetNumerator(heightNode,&op_box->height.numerator)"},
+        {"Width", "Numerator", "_GetNumerator(widthNode, &op_box->width.numerator)"},
     };
-    for (const auto& [tag, expression] : parts) {
+    for (const auto& row : rows) {
         std::string text = "<Bounds>" + Box("Source") + "</Bounds>";
-        const std::size_t part = text.find(std::string("<") + tag + ">");
-        const std::size_t start = text.find("<Denominator>", part) + 13;
-        text.erase(start, text.find("</Denominator>", start) - start);
+        const std::string begin = std::string("<") + row.number + ">";
+        const std::size_t part = text.find(std::string("<") + row.part + ">");
+        const std::size_t start = text.find(begin, part) + begin.size();
+        text.erase(start, text.find("</", start) - start);
         QTAttributesXMLParser parser = parse(text);
         RecordingLog log(host);
         BoundsBox box;
         EXPECT_EQ(parser.GetBox(kBoxSource, &box), NCF_E_UNEXPECTED);
-        EXPECT_TRUE(log.contains(expression)) << tag;
-    }
-    const std::pair<const char*, const char*> numerators[] = {
-        {"PositionY", "_GetNumerator(positionYNode,&op_box->positionY.numerator)"},
-        {"Height", "_GetNumerator(heightNode,&op_box->height.numerator)"},
-        {"Width", "_GetNumerator(widthNode, &op_box->width.numerator)"},
-    };
-    for (const auto& [tag, expression] : numerators) {
-        std::string text = "<Bounds>" + Box("Source") + "</Bounds>";
-        const std::size_t part = text.find(std::string("<") + tag + ">");
-        const std::size_t start = text.find("<Numerator>", part) + 11;
-        text.erase(start, text.find("</Numerator>", start) - start);
-        QTAttributesXMLParser parser = parse(text);
-        RecordingLog log(host);
-        BoundsBox box;
-        EXPECT_EQ(parser.GetBox(kBoxSource, &box), NCF_E_UNEXPECTED);
-        EXPECT_TRUE(log.contains(expression)) << tag;
+        EXPECT_TRUE(log.contains(row.expression)) << row.part << ' ' << row.number;
     }
 }
 
