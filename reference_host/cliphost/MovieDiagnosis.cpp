@@ -7,13 +7,13 @@
 
 #include <algorithm>
 #include <cmath>
-#include <fstream>
 #include <functional>
 #include <optional>
 
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/MissingSamples.h"
 #include "reference_host/header_parser/InspectHeaders.h"
+#include "reference_host/header_parser/StoredAtom.h"
 #include "reference_host/header_parser/Verdict.h"
 #include "reference_host/quicktime/OpenProblem.h"
 
@@ -256,25 +256,14 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
     return OfTracks(movie, header);
 }
 
-// Whether a whole fragment stands in the file.
-bool HoldsFragment(const std::filesystem::path& movie, ncfUInt64 fileSize) {
-    std::ifstream stream(movie, std::ios::binary);
-    ncfUInt64 position = 0;
-    for (ncfUInt8 head[16]; fileSize - position >= 8;) {
-        const bool isLong = fileSize - position >= sizeof head;
-        stream.seekg(static_cast<std::streamoff>(position));
-        if (!stream.read(reinterpret_cast<char*>(head), isLong ? sizeof head : 8)) {
-            return false;
+bool HoldsWholeFragment(const std::filesystem::path& movie) {
+    header_parser::FileBytes file(movie);
+    header_parser::StoredAtoms atoms(file);
+    header_parser::StoredAtom atom;
+    while (atoms.Next(atom)) {
+        if (atom.type == header_parser::Code("moof")) {
+            return !atom.isOpen && !atom.isCutShort;
         }
-        ncfUInt64 size = header_parser::LoadU32(head);
-        size = size == 1 && isLong ? header_parser::LoadU64(head + 8) : size;
-        if (size < 8 || size > fileSize - position) {
-            return false;
-        }
-        if (header_parser::LoadU32(head + 4) == header_parser::Code("moof")) {
-            return true;
-        }
-        position += size;
     }
     return false;
 }
@@ -289,7 +278,7 @@ Problem OfSecondRoute(const std::filesystem::path& movie, const HeaderReport& he
                                                             : nullptr;
     Problem problem{movie, refusal.Sentence(), refusal.code == NMA_E_NODATA ? kCopyAgain : ""};
     const bool isFragmented = refusal.reason.find("fragmented") != std::string::npos;
-    if (isFragmented && !HoldsFragment(movie, header.fileSize)) {
+    if (isFragmented && !HoldsWholeFragment(movie)) {
         problem.reason +=
             fmt::format("; the file ends at byte {} without a whole fragment", header.fileSize);
         problem.hint = kCopyAgain;
