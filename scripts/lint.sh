@@ -37,7 +37,7 @@ fi
 # The module alone: of the rest, the compilers' own warnings are enough.
 log=$(mktemp)
 cmake --preset asan >"$log" || { cat "$log"; exit 1; }
-if ! git ls-files 'source/*.cpp' | grep -v _win32 \
+if ! git ls-files 'source/*.cpp' | grep -v _windows \
   | xargs -P "$(nproc)" -n 4 clang-tidy -p build/asan --quiet >"$log" 2>/dev/null; then
   grep -E 'error:' "$log" | sort -u
   failed=1

@@ -97,7 +97,7 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     OutputFile output(options.output);
     output.Write(png.data(), png.size());
     output.Finish();
-    if (!OutputFile::IsStandardOutput(options.output)) {
+    if (!host::system::IsStandardOutput(options.output)) {
         fmt::print("{}: {} of {}\n", DisplayPath(options.output), frames.size() - failed,
                    Counted(reader.Count(), "frame"));
     }

@@ -9,14 +9,10 @@
 #include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/RouteTaken.h"
+#include "reference_host/cliphost/SampleDiagnosis.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
-namespace {
-
-using host::DisplayPath;
-
-}  // namespace
 
 Essence::Essence(Session& session, std::filesystem::path movie, const ParameterOptions& parameters)
     : session_(session), movie_(std::move(movie)) {
@@ -150,9 +146,7 @@ Problem Essence::Obstacle(const ClipTrack& track) {
                             "counts the further ones before the sound, so this sound can't be "
                             "delivered",
                             track.number),
-                "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c "
-                "copy SOUND.mov",
-                result};
+                kTakeSoundOut, result};
     }
     if (result < 0) {
         return {movie_, fmt::format("track {}: no sound formats", track.number), {}, result};

@@ -10,11 +10,12 @@
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
+#include "reference_host/cliphost/HeaderTracks.h"
 #include "reference_host/cliphost/MissingMedia.h"
-#include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Problem.h"
 #include "reference_host/cliphost/Session.h"
+#include "reference_host/cliphost/SoundAlone.h"
 
 namespace cliphost {
 

@@ -151,11 +151,7 @@ void Show(Essence& essence, bool json) {
     const Json list = FormatsOf(essence);
     if (json) {
         Json answer = {{"movie", MachinePath(essence.movie())}};
-        if (essence.undescribed()) {
-            AddProblem(essence.undescribed(), answer);
-        } else {
-            AddRoute(essence.movie(), answer);
-        }
+        AddProblemOrRoute(essence.undescribed(), essence.movie(), answer);
         answer["tracks"] = list;
         PrintJson(answer);
         return;

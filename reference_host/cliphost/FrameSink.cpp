@@ -48,7 +48,7 @@ public:
     }
     void Finish() override { output_.Finish(); }
     std::string Summary() const override {
-        return OutputFile::IsStandardOutput(file_)
+        return host::system::IsStandardOutput(file_)
                    ? std::string()
                    : fmt::format("{}: {}", DisplayPath(file_), Counted(frames_, "raw frame"));
     }
@@ -116,7 +116,7 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
     if (std::filesystem::is_directory(output, ignored)) {
         return std::make_unique<FolderSink>(output, movie.stem(), turn);
     }
-    if (OutputFile::DescriptorOf(output) || ending == ".raw" ||
+    if (host::system::DescriptorOf(output) || ending == ".raw" ||
         (OutputFile::IsDevice(output) && ending != ".png")) {
         return std::make_unique<RawSink>(output);
     }

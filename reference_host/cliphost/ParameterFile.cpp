@@ -51,9 +51,7 @@ std::string FromWideBytes(const std::filesystem::path& file, const std::string& 
     std::string text;
     // Surrogates that carry bytes of file names would come out as those bytes.
     const std::u32string characters = host::text::FromUtf16(units);
-    const bool isWhole = bytes.size() % 2 == 0 &&
-                         std::none_of(characters.begin(), characters.end(),
-                                      [](char32_t c) { return c >= 0xD800 && c <= 0xDFFF; });
+    const bool isWhole = bytes.size() % 2 == 0 && !host::text::HoldsSurrogate(characters);
     if (!isWhole || !host::text::ToUtf8(characters, text)) {
         Refuse(file, "begins as UTF-16 and goes on as something else");
     }

@@ -16,7 +16,7 @@
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/parameters/RegisterParameterComponents.h"
 #include "reference_host/quicktime/RegisterQuickTimeComponents.h"
-#include "reference_host/util/text/Paths.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
 
 namespace cliphost {
@@ -96,7 +96,7 @@ Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) 
                                : options.plugin;
     std::error_code ignored;
     // The module looks for its data files by the path that it was loaded from.
-    if (host::text::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
+    if (host::system::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
         throw Failure(kExitCaller, BackslashProblem(module));
     }
     host::LoadFailure failure;
@@ -142,7 +142,7 @@ host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
     if (Problem problem = WhyUnreachable(path)) {
         throw Failure(kExitCaller, std::move(problem));
     }
-    if (host::text::HoldsBackslash(absolute)) {
+    if (host::system::HoldsBackslash(absolute)) {
         throw Failure(kExitCaller, BackslashProblem(path));
     }
     return host::ModulePath(absolute);

@@ -5,9 +5,9 @@
 #include <algorithm>
 
 #include "reference_host/framework/Guard.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/DescriptionObjects.h"
 #include "reference_host/header_parser/SampleTableObject.h"
+#include "reference_host/util/Ref.h"
 
 namespace header_parser {
 

@@ -60,7 +60,7 @@ NMAString& NMAString::operator=(const NMAString& other) {
         encoding = other.state_->encoding;
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    state_->Hide();
+    state_->shown.Reset();
     state_->Take(std::move(copy));
     state_->encoding = encoding;
     return *this;
@@ -90,7 +90,7 @@ NMAString& NMAString::operator+=(const NMAString& tail) {
     Quietly(false, [&] {
         state_->LookAtShown();
         std::u32string joined = state_->text + copy.state_->text;
-        state_->Hide();
+        state_->shown.Reset();
         state_->Take(std::move(joined));
         return true;
     });
@@ -109,7 +109,13 @@ bool NMAString::IsEmpty() const {
 }
 
 NCFRESULT NMAString::CreateString(INCFString** out) {
-    return host::util::CreateHostString(out);
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    host::Ref<INCFString> made;
+    const NCFRESULT result = host::util::CreateHostString(made);
+    *out = made.Detach();
+    return result;
 }
 
 INCFString* NMAString::InArg() const {
@@ -117,24 +123,23 @@ INCFString* NMAString::InArg() const {
         return host::util::RefusingString();
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    if (state_->shown != nullptr) {
-        return state_->shown;
+    if (state_->shown) {
+        return state_->shown.get();
     }
-    INCFString* made = nullptr;
-    if (CreateString(&made) < 0) {
+    host::Ref<INCFString> made;
+    if (host::util::CreateHostString(made) < 0) {
         return host::util::RefusingString();
     }
     const NCFRESULT filled = Quietly(NCF_E_OUTOFMEMORY, [&] {
-        const NCFRESULT result = text::Assign(made, state_->text, state_->encoding);
+        const NCFRESULT result = text::Assign(made.get(), state_->text, state_->encoding);
         // Text that has no form in the wanted encoding is shown all the same.
-        return result >= 0 ? result : text::Assign(made, state_->text, kNCFUTF16);
+        return result >= 0 ? result : text::Assign(made.get(), state_->text, kNCFUTF16);
     });
     if (filled < 0) {
-        made->Release();
         return host::util::RefusingString();
     }
-    state_->shown = made;
-    return made;
+    state_->shown = std::move(made);
+    return state_->shown.get();
 }
 
 INCFString** NMAString::OutArg() {
@@ -143,9 +148,8 @@ INCFString** NMAString::OutArg() {
         return &nowhere;
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    state_->Hide();
     state_->Take({});
-    return &state_->shown;
+    return state_->shown.Out();
 }
 
 const char* NMAString::GetUTF8String() const {

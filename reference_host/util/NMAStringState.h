@@ -7,6 +7,7 @@
 #include <string>
 
 #include "host_interfaces/util/NMAString.h"
+#include "reference_host/util/Ref.h"
 #include "reference_host/util/text/HostText.h"
 
 // The text, its forms as they are asked for, and the host string that shows it.
@@ -19,19 +20,10 @@ struct NMAString::State {
     mutable std::mutex mutex;
     std::u32string text;
     ncfUInt32 encoding = kNCFUTF16;
-    INCFString* shown = nullptr;
+    host::Ref<INCFString> shown;
     std::optional<std::string> utf8;
     std::optional<std::u16string> utf16;
     std::optional<std::wstring> wide;
-
-    ~State() { Hide(); }
-
-    void Hide() {
-        if (shown != nullptr) {
-            shown->Release();
-            shown = nullptr;
-        }
-    }
 
     void Take(std::u32string changed) {
         text = std::move(changed);
@@ -43,10 +35,10 @@ struct NMAString::State {
     // Requires: the mutex is held. What pointers show stays while the text
     // does, so equal text leaves everything alone.
     void LookAtShown() {
-        if (shown == nullptr) {
+        if (!shown) {
             return;
         }
-        std::u32string current = host::text::Read(shown);
+        std::u32string current = host::text::Read(shown.get());
         if (current != text) {
             Take(std::move(current));
         }

@@ -5,9 +5,9 @@
 #include <cstring>
 #include <cwchar>
 
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/text/Encodings.h"
-#include "reference_host/util/text/Paths.h"
 
 namespace text = host::text;
 using host::util::Quietly;
@@ -33,7 +33,7 @@ NMAString NMAStringUtils::GetParentFolder(const NMAString& path) {
         return folder;
     }
     std::u32string& characters = folder.state_->text;
-    while (!characters.empty() && !text::IsSeparator(characters.back())) {
+    while (!characters.empty() && !host::system::IsSeparator(characters.back())) {
         characters.pop_back();
     }
     return folder;
@@ -45,7 +45,7 @@ NMAString NMAStringUtils::CombinePath(const NMAString& folder, const NMAString& 
         return path;
     }
     std::u32string& characters = path.state_->text;
-    if (!characters.empty() && !text::IsSeparator(characters.back())) {
+    if (!characters.empty() && !host::system::IsSeparator(characters.back())) {
         Quietly(false, [&] {
             characters.push_back(U'\\');
             return true;

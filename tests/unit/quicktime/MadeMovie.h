@@ -8,8 +8,8 @@
 #include <vector>
 
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/ByteReader.h"
+#include "reference_host/util/Ref.h"
 #include "tests/support/TestFolder.h"
 
 namespace quicktime_tests {

@@ -4,18 +4,21 @@
 
 #include "host_interfaces/framework/Types.h"
 
-// Names of the parameter document:
+// Words of the document in which parameters travel between host and module:
 //
 //     ncfComponents
 //       component @id              version, shortName
 //         track @number            activeSet
 //           parameterInfos         version, external*
-//             parameter @id        shortName, description, valueInfo
+//             parameter @id        shortName, description, valueInfo, displayRuleSet
 //             parameterGroup @id   ..., parameter*, parameterGroup*
 //           parameterSet @id       version, name
 //             parameter @id        one value element
-namespace NMA::XMLUtils {
+//
+// Users keep such documents, so no word ever changes.
+namespace NMA {
 
+inline constexpr char kParamRoot[] = "ncfComponents";
 inline constexpr char kParamComponent[] = "component";
 inline constexpr char kParamTrack[] = "track";
 inline constexpr char kParamInfos[] = "parameterInfos";
@@ -43,6 +46,21 @@ inline constexpr char kParamDefault[] = "default";
 inline constexpr char kParamTrueString[] = "trueString";
 inline constexpr char kParamFalseString[] = "falseString";
 inline constexpr char kParamValue[] = "value";
+
+// Rules by which the value of one parameter enables another.
+inline constexpr char kParamRuleSet[] = "displayRuleSet";
+inline constexpr char kParamRule[] = "displayRule";
+inline constexpr char kParamCondition[] = "ifCondition";
+inline constexpr char kParamConditionValue[] = "ifValue";
+inline constexpr char kParamOperation[] = "operation";
+inline constexpr char kParamEnable[] = "enable";
+inline constexpr char kParamDisable[] = "disable";
+
+// Values of attributes.
+inline constexpr char kParamShow[] = "show";
+inline constexpr char kParamHide[] = "hide";
+inline constexpr char kParamTrue[] = "true";
+inline constexpr char kParamFalse[] = "false";
 
 // Kinds of values.
 enum NMAParamKind : ncfUInt32 {
@@ -75,4 +93,4 @@ inline constexpr NMAParamKindNames kParamKindNames[kParamKindCount] = {
     {"valueInfoLabel", "valueLabel"},
 };
 
-}  // namespace NMA::XMLUtils
+}  // namespace NMA

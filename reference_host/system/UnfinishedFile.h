@@ -5,7 +5,7 @@
 #include <filesystem>
 #include <system_error>
 
-namespace cliphost {
+namespace host::system {
 
 // The name beside a file's place under which it is written until it is whole. A
 // link stays; what it leads to is the place.
@@ -28,4 +28,4 @@ private:
     int slot_ = -1;  // where the signal handler finds the name
 };
 
-}  // namespace cliphost
+}  // namespace host::system
