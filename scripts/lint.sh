@@ -16,6 +16,8 @@ rule 'the host knows the border alone' '#include "(source|aaf_library)/' -- refe
 rule 'the AAF library knows the border alone' '#include "(source|reference_host)/' -- aaf_library
 rule 'system headers belong in source/plugin/os/' \
   '#include <(windows|unistd|fcntl|dlfcn|pthread|sys/[a-z]+)\.h>' -- source public_include ':!source/plugin/os'
+rule 'system headers belong in reference_host/system/' \
+  '#include <(windows|bcrypt|unistd|fcntl|dlfcn|dirent|pthread|sys/[a-z]+)\.h>' -- reference_host ':!reference_host/system'
 rule 'throw typed codes, never literals or raw results' 'throw (0x|-?[0-9]|hr\b|\(?HRESULT)' -- source
 rule 'a long text has no fixed width here' '\b(unsigned )?long [a-z_A-Z]+ *(=|;|,|\))' -- source
 

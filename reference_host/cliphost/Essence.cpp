@@ -6,7 +6,6 @@
 
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
-#include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/SampleDiagnosis.h"
@@ -90,6 +89,12 @@ NMA::IUncompressedAudioProvider& Essence::sounds() {
     return *sounds_;
 }
 
+std::vector<ImageFormat> Essence::PictureFormats(const ClipTrack& track) {
+    std::vector<ImageFormat> formats;
+    Check(ReadImageFormats(pictures(), track.number, formats), track, "no picture formats");
+    return formats;
+}
+
 const ClipTrack* Essence::First(TrackKind kind) const {
     for (const ClipTrack& track : tracks_) {
         if (track.kind == kind) {
@@ -166,6 +171,19 @@ void Essence::NeedDelivery(const ClipTrack& track) {
 
 void Essence::Fail(const std::string& what, NCFRESULT result) const {
     throw Failure(kExitFile, Problem{movie_, what, {}, result});
+}
+
+void Essence::Check(NCFRESULT result, const ClipTrack& track, const std::string& what) const {
+    if (result < 0) {
+        Fail(fmt::format("track {}: {}", track.number, what), result);
+    }
+}
+
+void Essence::CheckSamples(NCFRESULT result, const ClipTrack& track,
+                           const std::string& what) const {
+    if (result < 0) {
+        FailSamples(track, fmt::format("track {}: {}", track.number, what), result);
+    }
 }
 
 void Essence::FailSamples(const ClipTrack& track, const std::string& what, NCFRESULT result,

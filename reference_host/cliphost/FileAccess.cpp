@@ -26,7 +26,7 @@ bool IsLink(const std::filesystem::path& path) {
 // What keeps the system from telling of a path, links followed; 0: nothing.
 int ReachError(const std::filesystem::path& path) {
     std::error_code error;
-    std::filesystem::status(path, error);
+    static_cast<void>(std::filesystem::status(path, error));
     return error.value();
 }
 

@@ -40,13 +40,6 @@ host::Ref<NMA::IMediaVolume> Volume(Session& session) {
     return volume;
 }
 
-std::string InSmallLetters(std::string text) {
-    for (char& c : text) {
-        c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-    }
-    return text;
-}
-
 bool HasMovieEnding(const std::filesystem::path& name) {
     const std::string ending = InSmallLetters(name.extension().native());
     return std::find(std::begin(kMovieEndings), std::end(kMovieEndings), ending) !=

@@ -32,9 +32,7 @@ Picture WritePng(const std::filesystem::path& file, const FrameReader& reader,
                                   reader.width(), reader.height(), reader.layout().name),
                       "take a .raw file");
     }
-    OutputFile output(file);
-    output.Write(png.data(), png.size());
-    output.Finish();
+    WriteWholeFile(file, png);
     return picture;
 }
 

@@ -82,4 +82,10 @@ void OutputFile::Fail(int error) {
                   NotWritten(isOwn ? std::filesystem::path("standard output") : path_, error));
 }
 
+void WriteWholeFile(const std::filesystem::path& path, const std::vector<unsigned char>& bytes) {
+    OutputFile output(path);
+    output.Write(bytes.data(), bytes.size());
+    output.Finish();
+}
+
 }  // namespace cliphost

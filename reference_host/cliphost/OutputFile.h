@@ -6,6 +6,7 @@
 #include <filesystem>
 #include <optional>
 #include <stdexcept>
+#include <vector>
 
 #include "reference_host/system/OutputStream.h"
 #include "reference_host/system/UnfinishedFile.h"
@@ -47,5 +48,8 @@ private:
     std::optional<host::system::UnfinishedFile> unfinished_;  // none: the place itself is written
     host::system::OutputStream stream_;  // goes before what it writes is removed
 };
+
+// Writes a file at once.
+void WriteWholeFile(const std::filesystem::path& path, const std::vector<unsigned char>& bytes);
 
 }  // namespace cliphost

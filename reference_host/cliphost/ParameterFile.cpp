@@ -5,11 +5,10 @@
 
 #include <fmt/format.h>
 
-#include <algorithm>
-#include <cctype>
 #include <fstream>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/parameters/ParameterDocument.h"
 #include "reference_host/util/text/Encodings.h"
 
@@ -70,10 +69,7 @@ std::string ClaimedEncoding(const std::string& text) {
     if (close == std::string::npos) {
         return {};
     }
-    std::string name = head.substr(open + 1, close - open - 1);
-    std::transform(name.begin(), name.end(), name.begin(),
-                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-    return name;
+    return InSmallLetters(head.substr(open + 1, close - open - 1));
 }
 
 }  // namespace

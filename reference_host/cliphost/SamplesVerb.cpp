@@ -89,10 +89,7 @@ Json ToJson(const SampleRun& run) {
 TrackMap SamplesRun::Read(const ClipTrack& track) {
     TrackMap map{track, ReadRuns(essence_.map(), track.number, fileSize_), {}};
     const RunMap& runs = map.runs;
-    if (runs.result < 0) {
-        essence_.Fail(fmt::format("track {}: its samples can't be mapped", track.number),
-                      runs.result);
-    }
+    essence_.Check(runs.result, track, "its samples can't be mapped");
     ncfUInt32 channels = 0;
     if (track.kind == TrackKind::Sound && !essence_.Obstacle(track) &&
         essence_.map().GetNumberOfChannels(track.number, &channels) >= 0) {

@@ -116,16 +116,9 @@ std::vector<std::string> Session::TakeNotices() {
     return std::exchange(notices_, {});
 }
 
-std::vector<std::filesystem::path> Session::MissingDataFiles() const {
-    std::vector<std::filesystem::path> missing;
-    for (const char* const name : {"FourCharMapper.xml", "AAFInfo.xml"}) {
-        const std::filesystem::path file = plugin_->file().parent_path() / name;
-        std::error_code ignored;
-        if (!std::filesystem::exists(std::filesystem::symlink_status(file, ignored))) {
-            missing.push_back(file);
-        }
-    }
-    return missing;
+std::vector<std::filesystem::path> Session::DataFiles() const {
+    const std::filesystem::path folder = plugin_->file().parent_path();
+    return {folder / "FourCharMapper.xml", folder / "AAFInfo.xml"};
 }
 
 Problem BackslashProblem(const std::filesystem::path& path) {

@@ -11,10 +11,8 @@
 namespace host {
 
 NCFRESULT PathFrom(INCFString* text, std::filesystem::path& out) {
-    if (text == nullptr) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
+        Need(text);
         const bool usable = host::system::ToSystemPath(text::Read(text), out) && !out.empty();
         return usable ? NCF_OK : NCF_E_INVALIDARG;
     });

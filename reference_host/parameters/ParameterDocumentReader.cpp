@@ -24,12 +24,6 @@ struct Refusal {
     std::string problem;
 };
 
-class NoEvents final : public XmlEvents {
-public:
-    NCFRESULT OnElement(const char*, const char**) override { return NCF_OK; }
-    NCFRESULT OnText(std::string_view) override { return NCF_OK; }
-};
-
 // "component/track/parameterSet": where a node stands.
 std::string PlaceOf(const pugi::xml_node& node) {
     std::string place = node.path('/');
@@ -246,7 +240,7 @@ NCFRESULT ReadParameterDocument(std::string_view xml, ParameterDocument& out,
             return NCF_E_NOTSUPPORTED;
         }
         // First for its words: the tree's own check has none.
-        NoEvents events;
+        XmlEvents events;
         EventReader check(events, "UTF-8");
         NCFRESULT result = check.Feed(xml.data(), xml.size(), true);
         if (result < 0) {

@@ -46,11 +46,6 @@ public:
 
 private:
     static Ref<String> S(std::string_view text) { return MakeString(text); }
-    static void Check(NCFRESULT result) {
-        if (result < 0) {
-            throw result;
-        }
-    }
 
     Ref<XmlWriter> writer_;
 };

@@ -20,6 +20,10 @@ enum class InputView {
 // ever read: lists of other files, picture sequences and the like lead nowhere.
 InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::string& reason);
 
+// The same for who wants one stream of it: null, too, where it has none of that
+// number.
+InputOwner OpenForStream(const std::filesystem::path& path, InputView view, int stream);
+
 // Of all sounds of a movie together, as the header parser has it, and what is said
 // of a movie that has more.
 inline constexpr int kMostChannelsOfMovie = 1024;

@@ -10,6 +10,29 @@
 #include "reference_host/util/Ref.h"
 #include "reference_host/util/text/HostText.h"
 
+namespace host::util {
+
+// Runs `body` and turns what it throws, memory that ran out, into `otherwise`.
+template <class Result, class Body>
+Result Quietly(Result otherwise, Body body) noexcept {
+    try {
+        return body();
+    } catch (...) {
+        return otherwise;
+    }
+}
+
+// The same for a body without a result; whether it came to its end.
+template <class Body>
+bool Quietly(Body body) noexcept {
+    return Quietly(false, [&] {
+        body();
+        return true;
+    });
+}
+
+}  // namespace host::util
+
 // The text, its forms as they are asked for, and the host string that shows it.
 //
 // `shown` comes from InArg, or from a callee through OutArg. Whoever holds it
@@ -43,18 +66,19 @@ struct NMAString::State {
             Take(std::move(current));
         }
     }
-};
 
-namespace host::util {
-
-// Runs `body` and turns what it throws, memory that ran out, into `otherwise`.
-template <class Result, class Body>
-Result Quietly(Result otherwise, Body body) noexcept {
-    try {
-        return body();
-    } catch (...) {
-        return otherwise;
+    // One of the forms, made when first asked for; `otherwise` without memory.
+    template <class Form, class Convert>
+    const typename Form::value_type* Shown(std::optional<Form> State::*form, Convert convert,
+                                           const typename Form::value_type* otherwise) {
+        const std::lock_guard<std::mutex> guard(mutex);
+        return host::util::Quietly(otherwise, [&] {
+            LookAtShown();
+            std::optional<Form>& made = this->*form;
+            if (!made) {
+                made = convert(text);
+            }
+            return made->c_str();
+        });
     }
-}
-
-}  // namespace host::util
+};

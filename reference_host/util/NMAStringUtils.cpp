@@ -18,11 +18,10 @@ NMAString NMAStringUtils::CreateWCharNMAString(const wchar_t* characters, ncfSIn
         return made;
     }
     made.state_->encoding = kNCFWCHAR;
-    Quietly(false, [&] {
+    Quietly([&] {
         const std::size_t units =
             length == -1 ? std::wcslen(characters) : static_cast<std::size_t>(length);
         made.state_->text = text::FromWide({characters, units});
-        return true;
     });
     return made;
 }
@@ -46,10 +45,7 @@ NMAString NMAStringUtils::CombinePath(const NMAString& folder, const NMAString& 
     }
     std::u32string& characters = path.state_->text;
     if (!characters.empty() && !host::system::IsSeparator(characters.back())) {
-        Quietly(false, [&] {
-            characters.push_back(U'\\');
-            return true;
-        });
+        Quietly([&] { characters.push_back(U'\\'); });
     }
     path += name;
     return path;

@@ -3,8 +3,8 @@
 
 #include "source/parameters/NMAParamComponent.h"
 
-#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/ParamItems.h"
+#include "source/parameters/ParamVocabulary.h"
 
 namespace NMA::XMLUtils {
 

@@ -3,8 +3,8 @@
 
 #include "source/parameters/NMAParamInfos.h"
 
-#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/ParamItems.h"
+#include "source/parameters/ParamVocabulary.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::XMLUtils {

@@ -3,9 +3,9 @@
 
 #include "source/parameters/NMAParamTrack.h"
 
-#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/ParamItems.h"
 #include "source/parameters/ParamText.h"
+#include "source/parameters/ParamVocabulary.h"
 
 namespace NMA::XMLUtils {
 

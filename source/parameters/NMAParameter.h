@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/NMAParamElement.h"
 #include "source/parameters/ParamText.h"
+#include "source/parameters/ParamVocabulary.h"
 
 namespace NMA::XMLUtils {
 

@@ -10,12 +10,14 @@
 #include <limits>
 #include <string>
 
-#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/descriptor_data/QTAttributesXMLParser.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::XMLUtils::ParamText {
 namespace {
+
+constexpr char kTrue[] = "true";
+constexpr char kFalse[] = "false";
 
 // Requires: `at` is zero-terminated. Moves `at` behind the number.
 ncfUInt64 TakeSigned(const char*& at) {
@@ -132,7 +134,7 @@ void Read(const NMAString& text, GUID& out) {
 }
 
 bool IsTrue(const NMAString& text) {
-    return std::strcmp(text.GetUTF8String(), kParamTrue) == 0;
+    return std::strcmp(text.GetUTF8String(), kTrue) == 0;
 }
 
 NMAString Write(ncfSInt32 value) {
@@ -176,7 +178,7 @@ NMAString Write(const GUID& value) {
 }
 
 NMAString WriteFlag(bool value) {
-    return NMAString(value ? kParamTrue : kParamFalse);
+    return NMAString(value ? kTrue : kFalse);
 }
 
 }  // namespace NMA::XMLUtils::ParamText
