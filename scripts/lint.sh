@@ -17,6 +17,8 @@ rule 'the AAF library knows the border alone' '#include "(source|reference_host)
 scripts/check_rooms.sh || failed=1
 rule 'system headers belong in source/plugin/os/' \
   '#include <(windows|unistd|fcntl|dlfcn|pthread|sys/[a-z]+)\.h>' -- source public_include ':!source/plugin/os'
+rule 'system headers belong in reference_host/system/' \
+  '#include <(windows|bcrypt|unistd|fcntl|dlfcn|dirent|pthread|sys/[a-z]+)\.h>' -- reference_host ':!reference_host/system'
 rule 'throw typed codes, never literals or raw results' 'throw (0x|-?[0-9]|hr\b|\(?HRESULT)' -- source
 rule 'a long text has no fixed width here' '\b(unsigned )?long [a-z_A-Z]+ *(=|;|,|\))' -- source
 
@@ -38,7 +40,7 @@ fi
 # The module alone: of the rest, the compilers' own warnings are enough.
 log=$(mktemp)
 cmake --preset asan >"$log" || { cat "$log"; exit 1; }
-if ! git ls-files 'source/*.cpp' | grep -v _win32 \
+if ! git ls-files 'source/*.cpp' | grep -v _windows \
   | xargs -P "$(nproc)" -n 4 clang-tidy -p build/asan --quiet >"$log" 2>/dev/null; then
   grep -E 'error:' "$log" | sort -u
   failed=1

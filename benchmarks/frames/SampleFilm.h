@@ -5,7 +5,7 @@
 #include <string>
 
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 // A film of 1920 by 1080 that the ffmpeg command makes once and that is deleted when
 // the program ends.

@@ -12,8 +12,8 @@
 
 #include "benchmarks/header_parser/LongMovie.h"
 #include "benchmarks/support/Brief.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/util/Ref.h"
 
 namespace {
 

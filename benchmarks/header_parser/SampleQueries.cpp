@@ -11,8 +11,8 @@
 #include <random>
 
 #include "benchmarks/header_parser/LongMovie.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/util/Ref.h"
 #include "tests/support/movies/TrackAtoms.h"
 
 namespace {

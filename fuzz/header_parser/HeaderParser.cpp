@@ -8,8 +8,8 @@
 #include <cstdlib>
 
 #include "fuzz/support/RunLimits.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/util/Ref.h"
 #include "tests/unit/header_parser/VisitEverything.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {

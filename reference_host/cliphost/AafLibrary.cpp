@@ -5,16 +5,18 @@
 
 #include <fmt/format.h>
 
-#include <cerrno>
-#include <cstdlib>
 #include <fstream>
 #include <system_error>
 
+#include "host_interfaces/Version.h"
 #include "host_interfaces/aaf/AAFResultCodes.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
+#include "reference_host/system/ScratchFolder.h"
+#include "reference_host/util/text/Encodings.h"
 
 namespace cliphost {
 namespace {
@@ -26,6 +28,11 @@ using host::DisplayPath;
 using PinTimeFunction = HRESULT (*)(const aafTimeStamp_t* time, const aafUID_t* generation);
 
 constexpr aafUID_t kPinnedGeneration = ncfGuid("00000000-0000-0000-0000-000000000001");
+
+// A path in the form that the library takes.
+std::wstring WideName(const std::filesystem::path& path) {
+    return host::text::ToWideLossy(host::system::FromSystemPath(path));
+}
 
 // Keeps the last sentence that the library writes for people, while this lives.
 class LibrarySentence final : public IAAFDiagnosticOutput {
@@ -60,32 +67,6 @@ public:
 private:
     AAFSetDiagnosticOutputFunction set_;
     std::string text_;
-};
-
-// A folder of our own, which is removed with its content.
-class ScratchFolder {
-public:
-    ScratchFolder() : path_(std::filesystem::temp_directory_path() / "cliphost-XXXXXX") {
-        std::string name = path_.native();
-        if (mkdtemp(name.data()) == nullptr) {
-            const int reason = errno;
-            throw Failure(kExitCaller, path_.parent_path(),
-                          "no folder can be made there: " + std::generic_category().message(reason),
-                          "name another one in TMPDIR");
-        }
-        path_ = name;
-    }
-    ~ScratchFolder() {
-        std::error_code ignored;
-        std::filesystem::remove_all(path_, ignored);
-    }
-    ScratchFolder(const ScratchFolder&) = delete;
-    ScratchFolder& operator=(const ScratchFolder&) = delete;
-
-    std::filesystem::path operator/(const char* name) const { return path_ / name; }
-
-private:
-    std::filesystem::path path_;
 };
 
 }  // namespace
@@ -123,9 +104,16 @@ bool AafLibrary::PinTime(const aafTimeStamp_t& time) {
 // The library writes files alone, so a device takes the bytes of one.
 void AafLibrary::SaveToDevice(IAAFFile* file, const std::filesystem::path& device) const {
     OutputFile output(device);
-    const ScratchFolder scratch;
-    Save(file, scratch / "clip.aaf");
-    std::ifstream saved(scratch / "clip.aaf", std::ios::binary);
+    std::error_code error;
+    const host::system::ScratchFolder scratch(error);
+    if (error) {
+        throw Failure(kExitCaller, std::filesystem::temp_directory_path(),
+                      "no folder can be made there: " + error.message(),
+                      "name another one in TMPDIR");
+    }
+    const std::filesystem::path clip = scratch.path() / "clip.aaf";
+    Save(file, clip);
+    std::ifstream saved(clip, std::ios::binary);
     char piece[65536];
     while (saved.read(piece, sizeof piece), saved.gcount() > 0) {
         output.Write(piece, static_cast<std::size_t>(saved.gcount()));
@@ -141,9 +129,9 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     const auto openNew = find<AAFFileOpenNewModifyExFunction>("AAFFileOpenNewModifyEx");
     aafCharacter company[] = L"Cliphost";
     aafCharacter product[] = L"cliphost";
-    aafCharacter version[] = L"1.3.2";
+    aafCharacter version[] = L"" PRODUCT_VERSION_TEXT;
     aafCharacter platform[] = L"";
-    aafProductVersion_t productVersion{1, 3, 2, 0, kAAFVersionReleased};
+    aafProductVersion_t productVersion{PRODUCT_VERSION_NUMBERS, 0, kAAFVersionReleased};
     aafProductIdentification_t identification{};
     identification.companyName = company;
     identification.productName = product;
@@ -168,8 +156,8 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
                 "not written: {} failed: {}", step,
                 reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result)) : reason));
     };
-    AafRef<IAAFFile> copy;
-    check(openNew(Wide(output.LeaveToOther().native()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
+    host::Ref<IAAFFile> copy;
+    check(openNew(WideName(output.LeaveToOther()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
                   &identification, copy.Out()),
           "opening a new file");
     check(file->SaveCopyAs(copy.get()), "copying the description");
@@ -178,10 +166,10 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     output.Finish();
 }
 
-AafRef<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
+host::Ref<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
     const auto openRead = find<AAFFileOpenExistingReadFunction>("AAFFileOpenExistingRead");
-    AafRef<IAAFFile> file;
-    const HRESULT result = openRead(Wide(path.native()).c_str(), 0, file.Out());
+    host::Ref<IAAFFile> file;
+    const HRESULT result = openRead(WideName(path).c_str(), 0, file.Out());
     if (result < 0) {
         throw Failure(kExitFile, path, "can't be read as AAF: " + TextOfResult(result));
     }
@@ -191,12 +179,11 @@ AafRef<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
 std::string AafLibrary::TextOfResult(HRESULT result) const {
     const auto length = find<AAFResultToTextBufLenFunction>("AAFResultToTextBufLen");
     const auto text = find<AAFResultToTextFunction>("AAFResultToText");
-    aafUInt32 bytes = 0;
-    if (!length || !text || length(result, &bytes) < 0 || bytes == 0) {
-        return {};
-    }
-    std::wstring wide(bytes / sizeof(aafCharacter) + 1, L'\0');
-    return text(result, wide.data(), bytes) < 0 ? std::string() : Utf8(wide.c_str());
+    return !length || !text
+               ? std::string()
+               : TextInTwoSteps(
+                     [&](aafUInt32* bytes) { return length(result, bytes); },
+                     [&](aafCharacter* to, aafUInt32 bytes) { return text(result, to, bytes); });
 }
 
 std::string AafLibrary::Version() const {

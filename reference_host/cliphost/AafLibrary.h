@@ -7,8 +7,8 @@
 
 #include "host_interfaces/aaf/AAFExports.h"
 #include "host_interfaces/aaf/AAFFile.h"
-#include "reference_host/cliphost/AafRef.h"
-#include "reference_host/framework/SharedLibrary.h"
+#include "reference_host/cliphost/AafQuery.h"
+#include "reference_host/system/SharedLibrary.h"
 
 namespace cliphost {
 
@@ -31,7 +31,7 @@ public:
     // or ReaderGone.
     void Save(IAAFFile* file, const std::filesystem::path& path) const;
     // Opens a saved file for reading. Throws a Failure.
-    AafRef<IAAFFile> Open(const std::filesystem::path& path) const;
+    host::Ref<IAAFFile> Open(const std::filesystem::path& path) const;
 
     // The library's own text for one of its codes, empty when it has none.
     std::string TextOfResult(HRESULT result) const;
@@ -45,7 +45,7 @@ private:
     }
 
     std::filesystem::path file_;
-    host::SharedLibrary library_;
+    host::system::SharedLibrary library_;
 };
 
 }  // namespace cliphost

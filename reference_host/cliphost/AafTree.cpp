@@ -32,17 +32,17 @@ eAAFTypeCategory_t CategoryOf(IAAFTypeDef* type) {
     return category;
 }
 
-AafRef<IAAFTypeDef> TypeOf(IAAFPropertyValue* value) {
-    AafRef<IAAFTypeDef> type;
+host::Ref<IAAFTypeDef> TypeOf(IAAFPropertyValue* value) {
+    host::Ref<IAAFTypeDef> type;
     value->GetType(type.Out());
     return type;
 }
 
 // The object behind a strong reference.
-AafRef<IAAFObject> ObjectBehind(IAAFPropertyValue* value) {
+host::Ref<IAAFObject> ObjectBehind(IAAFPropertyValue* value) {
     const auto type = TypeOf(value);
     const auto reference = As<IAAFTypeDefObjectRef>(type.get());
-    AafRef<IUnknown> target;
+    host::Ref<IUnknown> target;
     if (reference) {
         reference->GetObject(value, IID_IUnknown, target.Out());
     }
@@ -59,8 +59,8 @@ bool ReadParts(IAAFPropertyValue* value, int depth, std::vector<TreeNode>& parts
         }
         return true;
     }
-    AafRef<IAAFTypeDef> elementType;
-    AafRef<IEnumAAFPropertyValues> elements;
+    host::Ref<IAAFTypeDef> elementType;
+    host::Ref<IEnumAAFPropertyValues> elements;
     if (category == kAAFTypeCatVariableArray) {
         const auto array = As<IAAFTypeDefVariableArray>(type.get());
         if (array->GetType(elementType.Out()) < 0 ||
@@ -70,7 +70,7 @@ bool ReadParts(IAAFPropertyValue* value, int depth, std::vector<TreeNode>& parts
         aafUInt32 count = 0;
         array->GetCount(value, &count);
         for (aafUInt32 i = 0; i < count; ++i) {
-            AafRef<IAAFPropertyValue> element;
+            host::Ref<IAAFPropertyValue> element;
             if (array->GetElementValue(value, i, element.Out()) >= 0) {
                 ReadParts(element.get(), depth, parts);
             }
@@ -84,7 +84,7 @@ bool ReadParts(IAAFPropertyValue* value, int depth, std::vector<TreeNode>& parts
             set->GetElements(value, elements.Out()) < 0) {
             return false;
         }
-        AafRef<IAAFPropertyValue> element;
+        host::Ref<IAAFPropertyValue> element;
         while (elements->NextOne(element.Out()) >= 0) {
             ReadParts(element.get(), depth, parts);
         }
@@ -95,18 +95,18 @@ bool ReadParts(IAAFPropertyValue* value, int depth, std::vector<TreeNode>& parts
 
 TreeNode ReadObject(IAAFObject* object, int depth) {
     TreeNode node;
-    AafRef<IAAFClassDef> definition;
+    host::Ref<IAAFClassDef> definition;
     if (object->GetDefinition(definition.Out()) >= 0) {
         node.title = TextOf(definition.get(), &IAAFClassDef::GetNameBufLen, &IAAFClassDef::GetName);
     }
-    AafRef<IEnumAAFProperties> properties;
+    host::Ref<IEnumAAFProperties> properties;
     if (depth > kDeepest || object->GetProperties(properties.Out()) < 0) {
         return node;
     }
-    AafRef<IAAFProperty> property;
+    host::Ref<IAAFProperty> property;
     while (properties->NextOne(property.Out()) >= 0) {
-        AafRef<IAAFPropertyDef> propertyDefinition;
-        AafRef<IAAFPropertyValue> value;
+        host::Ref<IAAFPropertyDef> propertyDefinition;
+        host::Ref<IAAFPropertyValue> value;
         if (property->GetDefinition(propertyDefinition.Out()) < 0 ||
             property->GetValue(value.Out()) < 0) {
             continue;
@@ -143,14 +143,14 @@ int PlaceOf(IAAFMob* mob) {
 TreeNode ReadTree(IAAFFile* file) {
     TreeNode root;
     root.title = "AAF file";
-    AafRef<IAAFHeader> header;
-    AafRef<IEnumAAFMobs> enumerator;
+    host::Ref<IAAFHeader> header;
+    host::Ref<IEnumAAFMobs> enumerator;
     if (!file || file->GetHeader(header.Out()) < 0 ||
         header->GetMobs(nullptr, enumerator.Out()) < 0) {
         return root;
     }
-    std::vector<AafRef<IAAFMob>> mobs;
-    AafRef<IAAFMob> mob;
+    std::vector<host::Ref<IAAFMob>> mobs;
+    host::Ref<IAAFMob> mob;
     while (enumerator->NextOne(mob.Out()) >= 0) {
         mobs.push_back(mob);
     }

@@ -28,6 +28,10 @@ aafUID_t TypeId(IAAFTypeDef* type) {
     return id;
 }
 
+std::string NamedId(const std::string& name, const aafUID_t& id) {
+    return name.empty() ? ToText(id) : fmt::format("{} {}", name, ToText(id));
+}
+
 std::string IntegerText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     const auto integer = As<IAAFTypeDefInt>(type);
     aafUInt32 size = 0;
@@ -64,13 +68,11 @@ std::string MembersText(IAAFTypeDefRecord& record, IAAFPropertyValue* value) {
     record.GetCount(&count);
     std::string text;
     for (aafUInt32 i = 0; i < count; ++i) {
-        AafRef<IAAFPropertyValue> member;
-        aafUInt32 bytes = 0;
-        record.GetMemberNameBufLen(i, &bytes);
-        std::wstring name(bytes / sizeof(wchar_t) + 1, L'\0');
-        record.GetMemberName(i, name.data(), bytes);
+        host::Ref<IAAFPropertyValue> member;
+        const std::string name = TextOf(&record, &IAAFTypeDefRecord::GetMemberNameBufLen,
+                                        &IAAFTypeDefRecord::GetMemberName, i);
         const bool read = record.GetValue(value, i, member.Out()) >= 0;
-        text += fmt::format("{}{} {}", i == 0 ? "" : ", ", Utf8(name.c_str()),
+        text += fmt::format("{}{} {}", i == 0 ? "" : ", ", name,
                             read ? ValueText(member.get()) : kUnreadable);
     }
     return text;
@@ -130,13 +132,9 @@ std::string EnumText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     if (!enumeration || enumeration->GetIntegerValue(value, &number) < 0) {
         return kUnreadable;
     }
-    aafUInt32 bytes = 0;
-    if (enumeration->GetNameBufLenFromInteger(number, &bytes) < 0) {
-        return fmt::format("{}", number);
-    }
-    std::wstring name(bytes / sizeof(wchar_t) + 1, L'\0');
-    enumeration->GetNameFromInteger(number, name.data(), bytes);
-    return fmt::format("{} ({})", Utf8(name.c_str()), number);
+    const std::string name = TextOf(enumeration.get(), &IAAFTypeDefEnum::GetNameBufLenFromInteger,
+                                    &IAAFTypeDefEnum::GetNameFromInteger, number);
+    return name.empty() ? fmt::format("{}", number) : fmt::format("{} ({})", name, number);
 }
 
 std::string ExtendibleEnumText(IAAFTypeDef* type, IAAFPropertyValue* value) {
@@ -145,13 +143,10 @@ std::string ExtendibleEnumText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     if (!enumeration || enumeration->GetAUIDValue(value, &id) < 0) {
         return kUnreadable;
     }
-    aafUInt32 bytes = 0;
-    if (enumeration->GetNameBufLenFromAUID(id, &bytes) < 0) {
-        return ToText(id);
-    }
-    std::wstring name(bytes / sizeof(wchar_t) + 1, L'\0');
-    enumeration->GetNameFromAUID(id, name.data(), bytes);
-    return fmt::format("{} {}", Utf8(name.c_str()), ToText(id));
+    const std::string name = TextOf<IAAFTypeDefExtEnum, aafUID_constref>(
+        enumeration.get(), &IAAFTypeDefExtEnum::GetNameBufLenFromAUID,
+        &IAAFTypeDefExtEnum::GetNameFromAUID, id);
+    return NamedId(name, id);
 }
 
 // A reference to a definition, by its name.
@@ -161,14 +156,14 @@ std::string ReferenceText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     if (!reference || reference->GetObject(value, IID_IUnknown, &raw) < 0 || !raw) {
         return kUnreadable;
     }
-    AafRef<IUnknown> target;
+    host::Ref<IUnknown> target;
     *target.Out() = raw;
     if (const auto definition = As<IAAFDefObject>(target.get())) {
         aafUID_t id{};
         definition->GetAUID(&id);
         const std::string name =
             TextOf(definition.get(), &IAAFDefObject::GetNameBufLen, &IAAFDefObject::GetName);
-        return name.empty() ? ToText(id) : fmt::format("{} {}", name, ToText(id));
+        return NamedId(name, id);
     }
     if (const auto meta = As<IAAFMetaDefinition>(target.get())) {
         return TextOf(meta.get(), &IAAFMetaDefinition::GetNameBufLen, &IAAFMetaDefinition::GetName);
@@ -188,7 +183,7 @@ template <class ArrayType>
 std::string ArrayText(ArrayType& array, aafUInt32 count, IAAFPropertyValue* value) {
     std::vector<std::string> elements;
     for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
-        AafRef<IAAFPropertyValue> element;
+        host::Ref<IAAFPropertyValue> element;
         elements.push_back(array.GetElementValue(value, i, element.Out()) >= 0
                                ? ValueText(element.get())
                                : kUnreadable);
@@ -212,13 +207,13 @@ std::string FixedArrayText(IAAFTypeDef* type, IAAFPropertyValue* value) {
 
 std::string SetText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     const auto set = As<IAAFTypeDefSet>(type);
-    AafRef<IEnumAAFPropertyValues> enumerator;
+    host::Ref<IEnumAAFPropertyValues> enumerator;
     aafUInt32 count = 0;
     if (!set || set->GetCount(value, &count) < 0 || set->GetElements(value, enumerator.Out()) < 0) {
         return kUnreadable;
     }
     std::vector<std::string> elements;
-    AafRef<IAAFPropertyValue> element;
+    host::Ref<IAAFPropertyValue> element;
     while (elements.size() < kMostElements && enumerator->NextOne(element.Out()) >= 0) {
         elements.push_back(ValueText(element.get()));
     }
@@ -227,34 +222,22 @@ std::string SetText(IAAFTypeDef* type, IAAFPropertyValue* value) {
 
 std::string IndirectText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     const auto indirect = As<IAAFTypeDefIndirect>(type);
-    AafRef<IAAFPropertyValue> actual;
+    host::Ref<IAAFPropertyValue> actual;
     return indirect && indirect->GetActualValue(value, actual.Out()) >= 0 ? ValueText(actual.get())
                                                                           : kUnreadable;
 }
 
 std::string RenamedText(IAAFTypeDef* type, IAAFPropertyValue* value) {
     const auto rename = As<IAAFTypeDefRename>(type);
-    AafRef<IAAFPropertyValue> base;
+    host::Ref<IAAFPropertyValue> base;
     return rename && rename->GetBaseValue(value, base.Out()) >= 0 ? ValueText(base.get())
                                                                   : kUnreadable;
 }
 
 }  // namespace
 
-std::string Utf8(const std::wstring& wide) {
-    std::u32string text;
-    for (std::size_t i = 0; i < wide.size(); ++i) {
-        text += static_cast<char32_t>(wide[i]);
-    }
-    return host::text::ToUtf8Lossy(text);
-}
-
-std::wstring Wide(const std::string& utf8) {
-    std::wstring wide;
-    for (const char32_t c : host::text::FromUtf8(utf8)) {
-        wide += static_cast<wchar_t>(c);
-    }
-    return wide;
+std::string Utf8(std::wstring_view wide) {
+    return host::text::ToUtf8Lossy(host::text::FromWide(wide));
 }
 
 std::string ToText(const aafUID_t& id) {
@@ -309,7 +292,7 @@ std::string ValueText(IAAFPropertyValue* value) {
         {kAAFTypeCatIndirect, IndirectText},
         {kAAFTypeCatRename, RenamedText},
     };
-    AafRef<IAAFTypeDef> type;
+    host::Ref<IAAFTypeDef> type;
     eAAFTypeCategory_t category = kAAFTypeCatUnknown;
     if (!value || value->GetType(type.Out()) < 0 || type->GetTypeCategory(&category) < 0) {
         return kUnreadable;

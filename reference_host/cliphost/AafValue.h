@@ -3,7 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFObjects.h"
-#include "reference_host/cliphost/AafRef.h"
+#include "reference_host/cliphost/AafQuery.h"
 
 namespace cliphost {
 

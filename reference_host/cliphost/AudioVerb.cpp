@@ -144,7 +144,7 @@ int WriteSound(Essence& essence, const AudioOptions& options) {
     } catch (const ReaderGone&) {
         return kExitFine;
     }
-    if (!OutputFile::IsStandardOutput(options.output)) {
+    if (!host::system::IsStandardOutput(options.output)) {
         fmt::print("{}: {}, {}, 24 bits at {} Hz\n", DisplayPath(options.output),
                    Counted(count, "sample"), Counted(form.channels, "channel"), form.rate);
     }

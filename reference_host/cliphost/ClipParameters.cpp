@@ -14,6 +14,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/ResultText.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/HostText.h"
 
@@ -24,13 +25,6 @@ using host::DisplayPath;
 
 // The set that takes the values of the command line. It has no name of its own.
 constexpr GUID kCommandLineSet = ncfGuid("4D7B2A90-51C8-4E3F-9C06-B1A87E25F31D");
-
-std::string Lower(std::string text) {
-    std::transform(text.begin(), text.end(), text.begin(), [](unsigned char c) {
-        return static_cast<char>(c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c);
-    });
-    return text;
-}
 
 std::vector<host::ParameterInfo> InfosOf(const host::ParameterTrack& track) {
     std::vector<host::ParameterInfo> infos = track.parameters;
@@ -62,9 +56,9 @@ std::string Listed(const Items& items, TextOf textOf) {
 
 const host::ParameterInfo& FindParameter(const std::vector<host::ParameterInfo>& infos,
                                          const std::string& name) {
-    const std::string wanted = Lower(name);
+    const std::string wanted = InSmallLetters(name);
     for (const host::ParameterInfo& info : infos) {
-        if (Lower(info.name) == wanted || Lower(info.label) == wanted) {
+        if (InSmallLetters(info.name) == wanted || InSmallLetters(info.label) == wanted) {
             return info;
         }
     }
@@ -74,10 +68,10 @@ const host::ParameterInfo& FindParameter(const std::vector<host::ParameterInfo>&
 }
 
 ncfUInt32 FindValue(const host::ParameterInfo& info, const std::string& text) {
-    const std::string wanted = Lower(text);
+    const std::string wanted = InSmallLetters(text);
     std::vector<ncfUInt32> found;
     for (const host::ParameterChoice& choice : info.choices) {
-        const std::string words = Lower(choice.text);
+        const std::string words = InSmallLetters(choice.text);
         if (words == wanted) {
             return choice.value;
         }

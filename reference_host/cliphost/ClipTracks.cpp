@@ -10,22 +10,22 @@
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/aaf/AAFPictureDescriptors.h"
 #include "host_interfaces/aaf/AAFSoundDescriptors.h"
-#include "reference_host/cliphost/AafRef.h"
+#include "reference_host/cliphost/AafQuery.h"
 
 namespace cliphost {
 namespace {
 
 // The descriptor of the one mob that has several in one: the movie file.
-AafRef<IAAFMultipleDescriptor> FileDescriptors(IAAFFile* file) {
-    AafRef<IAAFHeader> header;
-    AafRef<IEnumAAFMobs> mobs;
+host::Ref<IAAFMultipleDescriptor> FileDescriptors(IAAFFile* file) {
+    host::Ref<IAAFHeader> header;
+    host::Ref<IEnumAAFMobs> mobs;
     if (!file || file->GetHeader(header.Out()) < 0 || header->GetMobs(nullptr, mobs.Out()) < 0) {
         return {};
     }
-    AafRef<IAAFMob> mob;
+    host::Ref<IAAFMob> mob;
     while (mobs->NextOne(mob.Out()) >= 0) {
         const auto source = As<IAAFSourceMob>(mob.get());
-        AafRef<IAAFEssenceDescriptor> essence;
+        host::Ref<IAAFEssenceDescriptor> essence;
         if (source && source->GetEssenceDescriptor(essence.Out()) >= 0) {
             if (auto several = As<IAAFMultipleDescriptor>(essence.get())) {
                 return several;
@@ -88,7 +88,7 @@ std::vector<ClipTrack> ReadClipTracks(IAAFFile* file) {
     }
     bool hasPicture = false;
     for (aafUInt32 i = 0; i < count; ++i) {
-        AafRef<IAAFFileDescriptor> descriptor;
+        host::Ref<IAAFFileDescriptor> descriptor;
         if (descriptors->GetFileDescriptorAt(i, descriptor.Out()) < 0) {
             break;
         }

@@ -93,11 +93,8 @@ int WriteSheet(Essence& essence, const ContactOptions& options) {
     if (failed == frames.size()) {
         throw Failure(kExitFile, options.movie, "no frame could be read, so there is no sheet");
     }
-    const std::vector<unsigned char> png = ToPng(sheet.picture());
-    OutputFile output(options.output);
-    output.Write(png.data(), png.size());
-    output.Finish();
-    if (!OutputFile::IsStandardOutput(options.output)) {
+    WriteWholeFile(options.output, ToPng(sheet.picture()));
+    if (!host::system::IsStandardOutput(options.output)) {
         fmt::print("{}: {} of {}\n", DisplayPath(options.output), frames.size() - failed,
                    Counted(reader.Count(), "frame"));
     }

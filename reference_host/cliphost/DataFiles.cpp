@@ -12,12 +12,6 @@ namespace {
 
 constexpr const char* kPutBack = "put back the one that belongs to the module";
 
-class NoEvents final : public host::XmlEvents {
-public:
-    NCFRESULT OnElement(const char*, const char**) override { return NCF_OK; }
-    NCFRESULT OnText(std::string_view) override { return NCF_OK; }
-};
-
 // "line 3, column 7: what is wrong" out of "3:7: what is wrong".
 std::string InWords(const std::string& problem) {
     const std::size_t line = problem.find(':');
@@ -29,7 +23,7 @@ std::string InWords(const std::string& problem) {
 }
 
 Problem DocumentProblem(const std::filesystem::path& file) {
-    NoEvents events;
+    host::XmlEvents events;
     host::EventReader reader(events, nullptr);
     std::string problem;
     const NCFRESULT result = host::ReadInputFile(
@@ -50,11 +44,15 @@ Problem DocumentProblem(const std::filesystem::path& file) {
 }  // namespace
 
 Problem DataFileProblem(const Session& session) {
-    for (const std::filesystem::path& file : session.MissingDataFiles()) {
-        return {file, "this data file is missing", "put it back beside the module"};
+    const std::vector<std::filesystem::path> files = session.DataFiles();
+    for (const std::filesystem::path& file : files) {
+        std::error_code ignored;
+        if (!std::filesystem::exists(std::filesystem::symlink_status(file, ignored))) {
+            return {file, "this data file is missing", "put it back beside the module"};
+        }
     }
-    for (const char* const name : {"FourCharMapper.xml", "AAFInfo.xml"}) {
-        if (Problem problem = DocumentProblem(session.plugin().file().parent_path() / name)) {
+    for (const std::filesystem::path& file : files) {
+        if (Problem problem = DocumentProblem(file)) {
             return problem;
         }
     }

@@ -7,6 +7,7 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/DataFiles.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
+#include "reference_host/cliphost/SampleDiagnosis.h"
 #include "reference_host/quicktime/OpenProblem.h"
 
 namespace cliphost {

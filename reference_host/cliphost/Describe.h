@@ -14,7 +14,7 @@ namespace cliphost {
 // One movie's description, or why there is none.
 struct Description {
     std::filesystem::path movie;
-    AafRef<IAAFFile> file;  // empty on failure
+    host::Ref<IAAFFile> file;  // empty on failure
     NCFRESULT result = NCF_OK;
     Problem problem;  // names the movie
     Problem doubt;    // what the header tells wrong; it is described all the same

@@ -71,7 +71,7 @@ int DescribeRun::Run() {
     }
     if (options_.json) {
         PrintJson(json_);
-    } else if (described_ + failed_ != 1 && !OutputFile::IsStandardOutput(options_.aafFile)) {
+    } else if (described_ + failed_ != 1 && !host::system::IsStandardOutput(options_.aafFile)) {
         fmt::print("{} described, {} not\n", described_, failed_);
     }
     return status_;
@@ -130,7 +130,7 @@ void DescribeRun::Take(const Description& description) {
         TellProblem(description.doubt, session_.verbosity());
     }
     std::filesystem::path saved;
-    AafRef<IAAFFile> shown = description.file;
+    host::Ref<IAAFFile> shown = description.file;
     if (!options_.aafFile.empty() || !options_.outFolder.empty()) {
         saved = TargetFor(description.movie);
         RefuseOutputOntoMovie(saved, description.movie);
@@ -144,7 +144,7 @@ void DescribeRun::Take(const Description& description) {
     }
     ++described_;
     TellRoute(description.movie, session_.verbosity());
-    if (OutputFile::IsStandardOutput(saved)) {
+    if (host::system::IsStandardOutput(saved)) {
         return;  // what is shown would be in the midst of the file
     }
     const TreeNode tree = ReadTree(shown.get());
@@ -208,7 +208,7 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                 throw Failure(kExitCaller, "--aaf", "it takes one movie",
                               "use --out-dir for several");
             }
-            if (options->json && OutputFile::IsStandardOutput(options->aafFile)) {
+            if (options->json && host::system::IsStandardOutput(options->aafFile)) {
                 throw Failure(kExitCaller, "--aaf", "standard output takes the JSON",
                               "name a file");
             }

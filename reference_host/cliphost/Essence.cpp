@@ -6,17 +6,12 @@
 
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
-#include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/RouteTaken.h"
+#include "reference_host/cliphost/SampleDiagnosis.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
-namespace {
-
-using host::DisplayPath;
-
-}  // namespace
 
 Essence::Essence(Session& session, std::filesystem::path movie, const ParameterOptions& parameters)
     : session_(session), movie_(std::move(movie)) {
@@ -94,6 +89,12 @@ NMA::IUncompressedAudioProvider& Essence::sounds() {
     return *sounds_;
 }
 
+std::vector<ImageFormat> Essence::PictureFormats(const ClipTrack& track) {
+    std::vector<ImageFormat> formats;
+    Check(ReadImageFormats(pictures(), track.number, formats), track, "no picture formats");
+    return formats;
+}
+
 const ClipTrack* Essence::First(TrackKind kind) const {
     for (const ClipTrack& track : tracks_) {
         if (track.kind == kind) {
@@ -150,9 +151,7 @@ Problem Essence::Obstacle(const ClipTrack& track) {
                             "counts all of them before the sound, so this sound can't be "
                             "delivered",
                             track.number),
-                "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c "
-                "copy SOUND.mov",
-                result};
+                kTakeSoundOut, result};
     }
     if (result < 0) {
         return {movie_, fmt::format("track {}: no sound formats", track.number), {}, result};
@@ -172,6 +171,19 @@ void Essence::NeedDelivery(const ClipTrack& track) {
 
 void Essence::Fail(const std::string& what, NCFRESULT result) const {
     throw Failure(kExitFile, Problem{movie_, what, {}, result});
+}
+
+void Essence::Check(NCFRESULT result, const ClipTrack& track, const std::string& what) const {
+    if (result < 0) {
+        Fail(fmt::format("track {}: {}", track.number, what), result);
+    }
+}
+
+void Essence::CheckSamples(NCFRESULT result, const ClipTrack& track,
+                           const std::string& what) const {
+    if (result < 0) {
+        FailSamples(track, fmt::format("track {}: {}", track.number, what), result);
+    }
 }
 
 void Essence::FailSamples(const ClipTrack& track, const std::string& what, NCFRESULT result,

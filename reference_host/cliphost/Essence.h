@@ -10,11 +10,13 @@
 #include "host_interfaces/media/MediaContainer.h"
 #include "host_interfaces/media/SampleMapping.h"
 #include "reference_host/cliphost/ClipTracks.h"
+#include "reference_host/cliphost/HeaderTracks.h"
+#include "reference_host/cliphost/ImageFormats.h"
 #include "reference_host/cliphost/MissingMedia.h"
-#include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/ParameterOptions.h"
 #include "reference_host/cliphost/Problem.h"
 #include "reference_host/cliphost/Session.h"
+#include "reference_host/cliphost/SoundAlone.h"
 
 namespace cliphost {
 
@@ -39,6 +41,7 @@ public:
     // Made when first asked for: these open the codec and the readers. Throw a
     // Failure.
     NMA::IUncompressedImageProvider& pictures();
+    std::vector<ImageFormat> PictureFormats(const ClipTrack& track);
     NMA::IUncompressedAudioProvider& sounds();
 
     // The track of a number, or the first of a kind for none. Throws a Failure
@@ -59,10 +62,13 @@ public:
 
     // Throws a Failure for a step that the module refused.
     [[noreturn]] void Fail(const std::string& what, NCFRESULT result) const;
+    // The same for one with a track, where it was.
+    void Check(NCFRESULT result, const ClipTrack& track, const std::string& what) const;
 
     // The same where the samples themselves may be the cause: it is told instead.
     [[noreturn]] void FailSamples(const ClipTrack& track, const std::string& what, NCFRESULT result,
                                   std::uint64_t sample = 0) const;
+    void CheckSamples(NCFRESULT result, const ClipTrack& track, const std::string& what) const;
     // Why a sample of a track could not be read; what is said where nothing but the
     // decoder could tell.
     Problem WhyUnread(const ClipTrack& track, std::uint64_t sample, NCFRESULT result) const;

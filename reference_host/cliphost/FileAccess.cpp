@@ -2,15 +2,12 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/FileAccess.h"
 
-#include <dirent.h>
-#include <fcntl.h>
 #include <fmt/format.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 #include <cerrno>
 
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Access.h"
 
 namespace cliphost {
 namespace {
@@ -26,13 +23,19 @@ bool IsLink(const std::filesystem::path& path) {
     return std::filesystem::is_symlink(std::filesystem::symlink_status(path, ignored));
 }
 
+// What keeps the system from telling of a path, links followed; 0: nothing.
+int ReachError(const std::filesystem::path& path) {
+    std::error_code error;
+    static_cast<void>(std::filesystem::status(path, error));
+    return error.value();
+}
+
 // The first part of the way, from the root on, that can't be reached.
 std::filesystem::path FirstOutOfReach(const std::filesystem::path& path) {
     std::filesystem::path part;
     for (const std::filesystem::path& name : path) {
         part /= name;
-        struct stat info {};
-        if (stat(part.c_str(), &info) != 0) {
+        if (ReachError(part) != 0) {
             break;
         }
     }
@@ -73,47 +76,50 @@ Problem OutOfReach(const std::filesystem::path& path, int error) {
     return {path, SystemText(error)};
 }
 
-const char* KindOf(mode_t mode) {
-    return S_ISFIFO(mode)   ? "a pipe"
-           : S_ISSOCK(mode) ? "a socket"
-           : S_ISBLK(mode)  ? "a block device"
-                            : "a character device";
+const char* KindOf(std::filesystem::file_type type) {
+    switch (type) {
+        case std::filesystem::file_type::fifo:
+            return "a pipe";
+        case std::filesystem::file_type::socket:
+            return "a socket";
+        case std::filesystem::file_type::block:
+            return "a block device";
+        default:
+            return "a character device";
+    }
 }
 
 }  // namespace
 
 Problem WhyUnreachable(const std::filesystem::path& path) {
-    struct stat info {};
-    return stat(path.c_str(), &info) == 0 ? Problem() : OutOfReach(path, errno);
+    const int error = ReachError(path);
+    return error == 0 ? Problem() : OutOfReach(path, error);
 }
 
 Problem WhyUnreadable(const std::filesystem::path& file) {
-    struct stat info {};
-    if (stat(file.c_str(), &info) != 0) {
-        return OutOfReach(file, errno);
+    if (Problem problem = WhyUnreachable(file)) {
+        return problem;
     }
-    if (S_ISDIR(info.st_mode)) {
+    std::error_code ignored;
+    const std::filesystem::file_type type = std::filesystem::status(file, ignored).type();
+    if (type == std::filesystem::file_type::directory) {
         return {file, "this is a folder", "give a movie in it"};
     }
     // A pipe would keep us waiting.
-    if (!S_ISREG(info.st_mode)) {
-        return {file, fmt::format("this is not a file but {}", KindOf(info.st_mode)),
-                S_ISSOCK(info.st_mode) ? "" : "copy what it delivers into a file"};
+    if (type != std::filesystem::file_type::regular) {
+        return {
+            file, fmt::format("this is not a file but {}", KindOf(type)),
+            type == std::filesystem::file_type::socket ? "" : "copy what it delivers into a file"};
     }
-    const int descriptor = open(file.c_str(), O_RDONLY | O_CLOEXEC);
-    if (descriptor < 0) {
-        const int error = errno;
-        return {file, "the file can't be opened: " + SystemText(error),
-                error == EACCES ? "get permission to read it" : ""};
+    const host::system::FirstByte first = host::system::ReadFirstByte(file);
+    if (first.openError != 0) {
+        return {file, "the file can't be opened: " + SystemText(first.openError),
+                first.openError == EACCES ? "get permission to read it" : ""};
     }
-    char byte = 0;
-    const ssize_t got = read(descriptor, &byte, 1);
-    const int error = errno;
-    close(descriptor);
-    if (got < 0) {
-        return {file, "the file can't be read: " + SystemText(error)};
+    if (first.readError != 0) {
+        return {file, "the file can't be read: " + SystemText(first.readError)};
     }
-    if (got == 0) {
+    if (!first.isThere) {
         return {file, "the file is empty", "copy it again from where it came"};
     }
     return {};
@@ -123,15 +129,14 @@ Problem WhyUnlistable(const std::filesystem::path& folder) {
     if (Problem problem = WhyUnreachable(folder)) {
         return problem;
     }
-    DIR* const list = opendir(folder.c_str());
-    if (!list) {
-        const int error = errno;
-        return {folder, "the folder can't be listed: " + SystemText(error),
-                error == EACCES ? "get permission to read it" : ""};
+    std::error_code error;
+    std::filesystem::directory_iterator(folder, error);
+    if (error) {
+        return {folder, "the folder can't be listed: " + error.message(),
+                error.value() == EACCES ? "get permission to read it" : ""};
     }
-    closedir(list);
-    if (access(folder.c_str(), X_OK) != 0) {
-        return {folder, "the folder can't be entered: " + SystemText(errno),
+    if (const int closed = host::system::AccessError(folder, host::system::Right::Search)) {
+        return {folder, "the folder can't be entered: " + SystemText(closed),
                 "get permission to search it"};
     }
     return {};

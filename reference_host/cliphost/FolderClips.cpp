@@ -14,7 +14,7 @@
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
-#include "reference_host/util/text/Paths.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -38,13 +38,6 @@ host::Ref<NMA::IMediaVolume> Volume(Session& session) {
     Check(session.host().Create(NMA::CompID_QuickTimeMediaVolume, volume),
           "the module makes no media volume");
     return volume;
-}
-
-std::string InSmallLetters(std::string text) {
-    for (char& c : text) {
-        c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-    }
-    return text;
 }
 
 bool HasMovieEnding(const std::filesystem::path& name) {
@@ -78,7 +71,7 @@ std::string NamesOf(const std::vector<std::filesystem::path>& movies) {
 
 std::string HowToName(const std::vector<std::filesystem::path>& movies) {
     const auto holdsBackslash = [](const std::filesystem::path& movie) {
-        return host::text::HoldsBackslash(movie.filename());
+        return host::system::HoldsBackslash(movie.filename());
     };
     const bool canBeGiven = std::none_of(movies.begin(), movies.end(), holdsBackslash);
     return fmt::format("rename {} so that the name ends in .mov, in small letters, such as {}{}",
@@ -110,7 +103,7 @@ OtherMovies FindOtherMovies(const std::filesystem::path& folder) {
         }
         if (name.extension() != kClaimedEnding) {
             others.otherEnding.push_back(entry->path());
-        } else if (host::text::HoldsBackslash(name)) {
+        } else if (host::system::HoldsBackslash(name)) {
             others.withBackslash.push_back(entry->path());
         }
     }

@@ -28,11 +28,7 @@ Json PictureFormat(Essence& essence, const ClipTrack& track, const ImageFormat& 
     if (result >= 0) {
         result = pictures.GetWorkingImageBufferRequirements(track.number, &alignment, &size);
     }
-    if (result < 0) {
-        essence.FailSamples(
-            track, fmt::format("track {}: format {} can't be set", track.number, format.index),
-            result);
-    }
+    essence.CheckSamples(result, track, fmt::format("format {} can't be set", format.index));
     return {{"index", format.index},
             {"name", NameOf(format)},
             {"words", WordsFor(format)},
@@ -48,11 +44,7 @@ Json PictureFormat(Essence& essence, const ClipTrack& track, const ImageFormat& 
 }
 
 void AddPicture(Essence& essence, const ClipTrack& track, Json& json) {
-    std::vector<ImageFormat> formats;
-    const NCFRESULT result = ReadImageFormats(essence.pictures(), track.number, formats);
-    if (result < 0) {
-        essence.Fail(fmt::format("track {}: no picture formats", track.number), result);
-    }
+    const std::vector<ImageFormat> formats = essence.PictureFormats(track);
     ncfUInt32 width = 0, height = 0;
     if (essence.pictures().GetWorkingImageSize(track.number, &width, &height) >= 0) {
         json["width"] = width;
@@ -87,9 +79,7 @@ void AddSound(Essence& essence, const ClipTrack& track, Json& json) {
                                                          bits, bytes, isLittle ? "little" : "big")},
                                    {"bufferBytes", bufferBytes}});
     }
-    if (result < 0) {
-        essence.Fail(fmt::format("track {}: no sound formats", track.number), result);
-    }
+    essence.Check(result, track, "no sound formats");
 }
 
 Json FormatsOf(Essence& essence) {
@@ -151,11 +141,7 @@ void Show(Essence& essence, bool json) {
     const Json list = FormatsOf(essence);
     if (json) {
         Json answer = {{"movie", MachinePath(essence.movie())}};
-        if (essence.undescribed()) {
-            AddProblem(essence.undescribed(), answer);
-        } else {
-            AddRoute(essence.movie(), answer);
-        }
+        AddProblemOrRoute(essence.undescribed(), essence.movie(), answer);
         answer["tracks"] = list;
         PrintJson(answer);
         return;

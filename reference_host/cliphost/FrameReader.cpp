@@ -18,12 +18,8 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     Choose(formatName);
     NMA::IUncompressedImageProvider& pictures = essence_.pictures();
     NCFRESULT result = pictures.SetWorkingImageFormat(track_.number, format_.index);
-    if (result < 0) {
-        essence_.FailSamples(
-            track_,
-            fmt::format("track {}: the format {} can't be set", track_.number, NameOf(format_)),
-            result);
-    }
+    essence_.CheckSamples(result, track_,
+                          fmt::format("the format {} can't be set", NameOf(format_)));
     ncfUInt32 width = 0, fieldHeight = 0;
     ncfUInt16 alignment = 0;
     ncfUInt64 size = 0;
@@ -31,20 +27,15 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     if (result >= 0) {
         result = pictures.GetWorkingImageBufferRequirements(track_.number, &alignment, &size);
     }
-    if (result < 0) {
-        essence_.Fail(fmt::format("track {}: no picture size", track_.number), result);
-    }
+    essence_.Check(result, track_, "no picture size");
     // The size told is that of a field where there are two; the buffer always
     // holds a frame.
     const ncfUInt64 lineBytes = ncfUInt64{width} * static_cast<ncfUInt64>(layout().bytesPerPixel);
     width_ = static_cast<int>(width);
     height_ = lineBytes == 0 ? 0 : static_cast<int>(size / lineBytes);
     frameBytes_ = size;
-    result = essence_.provider().Setup(track_.number);
-    if (result < 0) {
-        essence_.FailSamples(
-            track_, fmt::format("track {}: the reader does not start", track_.number), result);
-    }
+    essence_.CheckSamples(essence_.provider().Setup(track_.number), track_,
+                          "the reader does not start");
 }
 
 FrameReader::~FrameReader() {
@@ -52,11 +43,7 @@ FrameReader::~FrameReader() {
 }
 
 void FrameReader::Choose(const std::string& formatName) {
-    std::vector<ImageFormat> formats;
-    const NCFRESULT result = ReadImageFormats(essence_.pictures(), track_.number, formats);
-    if (result < 0) {
-        essence_.Fail(fmt::format("track {}: no picture formats", track_.number), result);
-    }
+    const std::vector<ImageFormat> formats = essence_.PictureFormats(track_);
     if (const ImageFormat* const chosen = ChooseFormat(formats, formatName)) {
         format_ = *chosen;
         return;

@@ -33,9 +33,7 @@ Picture WritePng(const std::filesystem::path& file, const FrameReader& reader,
                         reader.width(), reader.height(), reader.layout().name),
             "write a .raw file");
     }
-    OutputFile output(file);
-    output.Write(png.data(), png.size());
-    output.Finish();
+    WriteWholeFile(file, png);
     return picture;
 }
 
@@ -49,7 +47,7 @@ public:
     }
     void Finish() override { output_.Finish(); }
     std::string Summary() const override {
-        return OutputFile::IsStandardOutput(file_)
+        return host::system::IsStandardOutput(file_)
                    ? std::string()
                    : fmt::format("{}: {}", DisplayPath(file_), Counted(frames_, "raw frame"));
     }
@@ -117,7 +115,7 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
     if (std::filesystem::is_directory(output, ignored)) {
         return std::make_unique<FolderSink>(output, movie.stem(), turn);
     }
-    if (OutputFile::DescriptorOf(output) || ending == ".raw" ||
+    if (host::system::DescriptorOf(output) || ending == ".raw" ||
         (OutputFile::IsDevice(output) && ending != ".png")) {
         return std::make_unique<RawSink>(output);
     }

@@ -6,16 +6,13 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
-#include <fstream>
-#include <functional>
-#include <optional>
 
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/MissingSamples.h"
-#include "reference_host/header_parser/InspectHeaders.h"
+#include "reference_host/cliphost/RouteTaken.h"
+#include "reference_host/cliphost/SoundAlone.h"
+#include "reference_host/header_parser/StoredAtom.h"
 #include "reference_host/header_parser/Verdict.h"
-#include "reference_host/quicktime/OpenProblem.h"
 
 namespace cliphost {
 namespace {
@@ -29,22 +26,8 @@ constexpr const char* kNoRate = "The frame rate of the movie can't be determined
 constexpr const char* kNoLength = "The length of the movie can't be determined.";
 constexpr const char* kNoTracks = "Movie doesn't contain any video/audio tracks!";
 
-constexpr const char* kCopyAgain = "copy the file again from where it came";
-
-constexpr const char* kTakeSoundOut =
-    "take the sound out of the movie, for instance with ffmpeg -i FILE -map 0:a -c copy SOUND.mov";
-constexpr const char* kNeedsKey = "only someone with the key can read them";
-constexpr const char* kConvert = "convert it with a program that knows this codec";
-constexpr const char* kSaveInOne =
-    "save the movie with its media in one file, such as with ffmpeg -i FILE -c copy WHOLE.mov";
-
 bool HasSaid(const std::vector<std::string>& notices, const char* line) {
     return std::find(notices.begin(), notices.end(), line) != notices.end();
-}
-
-const std::vector<ncfUInt32>& TracksOf(const HeaderReport& header, TrackKind kind) {
-    return header.movie->Of(kind == TrackKind::Sound ? header_parser::TrackKind::kSound
-                                                     : header_parser::TrackKind::kVideo);
 }
 
 std::string SecondsWords(ncfUInt64 units, const Track& track) {
@@ -74,25 +57,6 @@ std::string RateWords(const HeaderReport& header) {
                        SecondsWords(track.toldMediaDuration, track));
 }
 
-// Without a description packets of several samples count as one.
-bool CountsPackets(const Track& track) {
-    return track.samples.Count() != track.mediaDuration;
-}
-
-// How the sound of a movie without description is had.
-std::string SoundHint(const HeaderReport& header) {
-    const std::vector<ncfUInt32>& sounds = TracksOf(header, TrackKind::Sound);
-    if (sounds.empty() || header.movie->tracks[sounds.front()].sound.empty()) {
-        return {};
-    }
-    const Track& track = header.movie->tracks[sounds.front()];
-    if (CountsPackets(track)) {
-        return kTakeSoundOut;
-    }
-    return fmt::format("extract the sound alone: cliphost audio FILE --rate {:.0f} -o FILE.wav",
-                       track.sound.front().rate);
-}
-
 Problem WithoutRate(const std::filesystem::path& movie, const HeaderReport& header) {
     if (!header.movie || TracksOf(header, TrackKind::Picture).empty()) {
         return {movie, "nothing in it tells its frame rate"};
@@ -109,32 +73,6 @@ std::string WhatIsMissing(const HeaderReport& header) {
         }
     }
     return {};
-}
-
-// That samples of a track lie in another file: those of one description, or all
-// for none given.
-std::string WhatIsElsewhere(const HeaderReport& header, std::size_t place,
-                            std::optional<std::size_t> description = {}) {
-    const std::vector<bool>& isHere = header.movie->tracks[place].isInFile;
-    const bool isElsewhere = description
-                                 ? *description < isHere.size() && !isHere[*description]
-                                 : std::find(isHere.begin(), isHere.end(), false) != isHere.end();
-    return isElsewhere ? fmt::format(
-                             "track {} of the file: its samples are in another file, and "
-                             "only this one is read",
-                             place + 1)
-                       : std::string();
-}
-
-std::vector<ncfUInt32> CodecsOf(const Track& track) {
-    std::vector<ncfUInt32> codecs;
-    for (const auto& one : track.video) {
-        codecs.push_back(one.codec);
-    }
-    for (const auto& one : track.sound) {
-        codecs.push_back(one.codec);
-    }
-    return codecs;
 }
 
 // Tracks that can't be told from each other.
@@ -163,10 +101,6 @@ std::string WhatIsTooLong(const HeaderReport& header) {
         }
     }
     return {};
-}
-
-Problem OfCodec(const std::filesystem::path& movie, const host::CodecProblem& codec) {
-    return {movie, codec.sentence, host::IsEncrypted(codec.code) ? kNeedsKey : kConvert};
 }
 
 // What keeps the samples of the first tracks from being decoded, where the library
@@ -256,25 +190,14 @@ Problem OfFirstRoute(const std::filesystem::path& movie, const HeaderReport& hea
     return OfTracks(movie, header);
 }
 
-// Whether a whole fragment stands in the file.
-bool HoldsFragment(const std::filesystem::path& movie, ncfUInt64 fileSize) {
-    std::ifstream stream(movie, std::ios::binary);
-    ncfUInt64 position = 0;
-    for (ncfUInt8 head[16]; fileSize - position >= 8;) {
-        const bool isLong = fileSize - position >= sizeof head;
-        stream.seekg(static_cast<std::streamoff>(position));
-        if (!stream.read(reinterpret_cast<char*>(head), isLong ? sizeof head : 8)) {
-            return false;
+bool HoldsWholeFragment(const std::filesystem::path& movie) {
+    header_parser::FileBytes file(movie);
+    header_parser::StoredAtoms atoms(file);
+    header_parser::StoredAtom atom;
+    while (atoms.Next(atom)) {
+        if (atom.type == header_parser::Code("moof")) {
+            return !atom.isOpen && !atom.isCutShort;
         }
-        ncfUInt64 size = header_parser::LoadU32(head);
-        size = size == 1 && isLong ? header_parser::LoadU64(head + 8) : size;
-        if (size < 8 || size > fileSize - position) {
-            return false;
-        }
-        if (header_parser::LoadU32(head + 4) == header_parser::Code("moof")) {
-            return true;
-        }
-        position += size;
     }
     return false;
 }
@@ -289,7 +212,7 @@ Problem OfSecondRoute(const std::filesystem::path& movie, const HeaderReport& he
                                                             : nullptr;
     Problem problem{movie, refusal.Sentence(), refusal.code == NMA_E_NODATA ? kCopyAgain : ""};
     const bool isFragmented = refusal.reason.find("fragmented") != std::string::npos;
-    if (isFragmented && !HoldsFragment(movie, header.fileSize)) {
+    if (isFragmented && !HoldsWholeFragment(movie)) {
         problem.reason +=
             fmt::format("; the file ends at byte {} without a whole fragment", header.fileSize);
         problem.hint = kCopyAgain;
@@ -300,61 +223,6 @@ Problem OfSecondRoute(const std::filesystem::path& movie, const HeaderReport& he
         problem.hint = codec.hint;
     }
     return problem;
-}
-
-// Why a sample is not delivered, as far as the header tells.
-Problem OfSample(const HeaderReport& header, std::size_t place, TrackKind kind,
-                 std::uint64_t sample) {
-    const Track& track = header.movie->tracks[place];
-    const std::vector<ncfUInt32> codecs = CodecsOf(track);
-    // Sound is counted in what its packets hold.
-    const auto description =
-        DescriptionOf(track, kind == TrackKind::Sound && codecs.size() == 1 ? 0 : sample);
-    const ncfUInt32 codec = description && *description < codecs.size() ? codecs[*description] : 0;
-    if (host::IsEncrypted(codec)) {
-        return {{},
-                fmt::format("track {} of the file: its samples are encrypted ({})", place + 1,
-                            header_parser::NameOf(codec)),
-                kNeedsKey};
-    }
-    if (std::string elsewhere = WhatIsElsewhere(header, place, description); !elsewhere.empty()) {
-        return {{}, elsewhere, kSaveInOne};
-    }
-    const MissingSamples missing(header, place);
-    if (kind == TrackKind::Sound ? missing.ConcernSound(sample) : missing.ConcernPicture(sample)) {
-        return {{}, missing.Sentence(), kCopyAgain};
-    }
-    if (std::adjacent_find(codecs.begin(), codecs.end(), std::not_equal_to<>()) != codecs.end()) {
-        std::string names;
-        for (const ncfUInt32 one : codecs) {
-            names += (names.empty() ? "" : " and ") + header_parser::NameOf(one) +
-                     (host::IsEncrypted(one) ? " (encrypted)" : "");
-        }
-        return {{},
-                fmt::format("track {} of the file: its sample descriptions name the codecs {}, "
-                            "but the multimedia library reads one codec per track",
-                            place + 1, names)};
-    }
-    return {};
-}
-
-// A track of a header that is understood, with its place in the file.
-struct Found {
-    const Track* track = nullptr;
-    std::size_t place = 0;
-};
-
-Found Find(const HeaderReport& header, const WhichTrack& which) {
-    if (!header.movie || which.place >= TracksOf(header, which.kind).size()) {
-        return {};
-    }
-    const std::size_t place = TracksOf(header, which.kind)[which.place];
-    return {&header.movie->tracks[place], place};
-}
-
-RouteTaken RouteOf(const HeaderReport& header) {
-    const std::string refused = header.WhyOfNoUse();
-    return {refused.empty() ? route::kHeader : route::kLibrary, refused};
 }
 
 }  // namespace
@@ -394,108 +262,6 @@ Problem DiagnoseMovie(const std::filesystem::path& movie, const std::vector<std:
         problem.reason += "; nor can the multimedia library read it: " + opening;
     }
     return problem;
-}
-
-Problem DiagnoseSamples(const std::filesystem::path& movie, const WhichTrack& which,
-                        std::uint64_t sample) {
-    const HeaderReport header = header_parser::InspectHeaders(movie);
-    const RouteTaken taken = RouteOf(header);
-    const auto because = [&](std::string reason, std::string hint) {
-        return Problem{movie, std::move(reason), std::move(hint), NCF_OK, taken.route};
-    };
-    const auto [track, number] = Find(header, which);
-    if (track && track->samples.Count() == 0) {
-        return because(fmt::format("track {} of the file: it holds no samples", number + 1), {});
-    }
-    if (track) {
-        if (const Problem found = OfSample(header, number, which.kind, sample)) {
-            return because(found.reason, found.hint);
-        }
-    }
-    const bool ofSound = which.kind == TrackKind::Sound;
-    // A decoder refuses such a size too, and does not say why.
-    if (!ofSound) {
-        if (const Problem raster = WrongRaster(movie)) {
-            return because(raster.reason, raster.hint);
-        }
-    }
-    // Tracks of a header that is read are those of the library, place by place.
-    if (const host::CodecProblem codec = track && taken.reason.empty()
-                                             ? host::DecoderProblem(movie, number)
-                                             : host::DecoderProblem(movie, ofSound, which.place)) {
-        const Problem problem = OfCodec(movie, codec);
-        return because(problem.reason, problem.hint);
-    }
-    // What is only left to the library is nothing wrong.
-    if (header.refusal && header.refusal.code != NCF_E_NOTSUPPORTED) {
-        return because(
-            fmt::format("{}; the multimedia library can open it, but delivers no such {}",
-                        header.refusal.Sentence(), ofSound ? "sound" : "picture"),
-            header.refusal.code == NMA_E_NODATA ? kCopyAgain : "");
-    }
-    return {};
-}
-
-std::string WhyNotShown(const std::filesystem::path& movie, const WhichTrack& which) {
-    const HeaderReport header = header_parser::InspectHeaders(movie);
-    const Found found = Find(header, which);
-    const ncfUInt32 count = found.track ? found.track->samples.Count() : 0;
-    if (count == 0) {
-        const std::string refused = header.WhyOfNoUse();
-        return refused.empty() ? "it has no frames"
-                               : refused + "; the multimedia library finds nothing to show in it";
-    }
-    return fmt::format("track {} of the file: {} none of its {}", found.place + 1,
-                       found.track->edits.IsEmpty() ? "its times show" : "its edits show",
-                       Counted(count, "sample"));
-}
-
-std::string WhatPictureLacks(const std::filesystem::path& movie, std::size_t place) {
-    const HeaderReport header = header_parser::InspectHeaders(movie);
-    if (!header.movie || place >= TracksOf(header, TrackKind::Picture).size()) {
-        return {};
-    }
-    return MissingSamples(header, TracksOf(header, TrackKind::Picture)[place]).Sentence();
-}
-
-SoundAlone SoundWithoutDescription(const std::filesystem::path& movie, std::size_t place) {
-    const HeaderReport header = header_parser::InspectHeaders(movie);
-    SoundAlone sound;
-    if (!header.movie || place >= TracksOf(header, TrackKind::Sound).size()) {
-        return sound;
-    }
-    const ncfUInt32 number = TracksOf(header, TrackKind::Sound)[place];
-    const Track& track = header.movie->tracks[number];
-    sound.rate = track.sound.empty() ? 0 : static_cast<unsigned>(std::lround(track.sound[0].rate));
-    if (CountsPackets(track)) {
-        sound.problem = {movie,
-                         fmt::format("track {} of the file: its packets hold several samples each, "
-                                     "and only a description tells how many they are",
-                                     number + 1),
-                         kTakeSoundOut, NCF_OK, route::kHeader};
-    }
-    return sound;
-}
-
-std::string WhatLiesElsewhere(const std::filesystem::path& movie, const WhichTrack& which) {
-    const HeaderReport header = header_parser::InspectHeaders(movie);
-    const auto [track, place] = Find(header, which);
-    if (!track ||
-        std::find(track->isInFile.begin(), track->isInFile.end(), true) != track->isInFile.end()) {
-        return {};
-    }
-    return WhatIsElsewhere(header, place);
-}
-
-RouteTaken RouteOf(const std::filesystem::path& movie) {
-    return RouteOf(header_parser::InspectHeaders(movie));
-}
-
-Problem WrongRaster(const std::filesystem::path& movie) {
-    const std::string raster = host::RasterProblem(movie);
-    return raster.empty()
-               ? Problem{}
-               : Problem{movie, raster, "its description is damaged: " + std::string(kCopyAgain)};
 }
 
 }  // namespace cliphost

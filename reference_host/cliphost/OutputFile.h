@@ -6,8 +6,10 @@
 #include <filesystem>
 #include <optional>
 #include <stdexcept>
+#include <vector>
 
-#include "reference_host/cliphost/UnfinishedFile.h"
+#include "reference_host/system/OutputStream.h"
+#include "reference_host/system/UnfinishedFile.h"
 
 namespace cliphost {
 
@@ -24,7 +26,6 @@ public:
 class OutputFile {
 public:
     explicit OutputFile(std::filesystem::path path);  // throws a Failure
-    ~OutputFile();
     OutputFile(const OutputFile&) = delete;
     OutputFile& operator=(const OutputFile&) = delete;
 
@@ -37,18 +38,18 @@ public:
     // Throws the Failure for what the system said.
     [[noreturn]] void Fail(int error);
 
-    // The open descriptor that a path stands for: "-", "/dev/stdout", "/dev/fd/5".
-    static std::optional<int> DescriptorOf(const std::filesystem::path& path);
-    static bool IsStandardOutput(const std::filesystem::path& path) {
-        return DescriptorOf(path) == 1;
-    }
-    // Whether a path is such a descriptor, or a device or pipe that is there.
+    // Whether a path stands for an open descriptor, or is a device or pipe.
     static bool IsDevice(const std::filesystem::path& path);
 
 private:
+    void Check(int error);
+
     std::filesystem::path path_;
-    std::optional<UnfinishedFile> unfinished_;  // none: the place itself is written
-    int descriptor_ = -1;
+    std::optional<host::system::UnfinishedFile> unfinished_;  // none: the place itself is written
+    host::system::OutputStream stream_;  // goes before what it writes is removed
 };
+
+// Writes a file at once.
+void WriteWholeFile(const std::filesystem::path& path, const std::vector<unsigned char>& bytes);
 
 }  // namespace cliphost

@@ -5,11 +5,10 @@
 
 #include <fmt/format.h>
 
-#include <algorithm>
-#include <cctype>
 #include <fstream>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/parameters/ParameterDocument.h"
 #include "reference_host/util/text/Encodings.h"
 
@@ -51,9 +50,7 @@ std::string FromWideBytes(const std::filesystem::path& file, const std::string& 
     std::string text;
     // Surrogates that carry bytes of file names would come out as those bytes.
     const std::u32string characters = host::text::FromUtf16(units);
-    const bool isWhole = bytes.size() % 2 == 0 &&
-                         std::none_of(characters.begin(), characters.end(),
-                                      [](char32_t c) { return c >= 0xD800 && c <= 0xDFFF; });
+    const bool isWhole = bytes.size() % 2 == 0 && !host::text::HoldsSurrogate(characters);
     if (!isWhole || !host::text::ToUtf8(characters, text)) {
         Refuse(file, "begins as UTF-16 and goes on as something else");
     }
@@ -72,10 +69,7 @@ std::string ClaimedEncoding(const std::string& text) {
     if (close == std::string::npos) {
         return {};
     }
-    std::string name = head.substr(open + 1, close - open - 1);
-    std::transform(name.begin(), name.end(), name.begin(),
-                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
-    return name;
+    return InSmallLetters(head.substr(open + 1, close - open - 1));
 }
 
 }  // namespace

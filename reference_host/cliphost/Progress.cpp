@@ -4,9 +4,10 @@
 #include "reference_host/cliphost/Progress.h"
 
 #include <fmt/format.h>
-#include <unistd.h>
 
 #include <cstdio>
+
+#include "reference_host/system/Process.h"
 
 namespace cliphost {
 namespace {
@@ -21,7 +22,7 @@ void Show(const std::string& text) {
 }  // namespace
 
 Progress::Progress(std::string what, std::size_t count)
-    : what_(std::move(what)), count_(count), shown_(count > 1 && isatty(STDERR_FILENO) != 0) {}
+    : what_(std::move(what)), count_(count), shown_(count > 1 && host::system::IsWatched()) {}
 
 Progress::~Progress() {
     if (shown_) {

@@ -4,11 +4,19 @@
 
 #include <nlohmann/json.hpp>
 
-#include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
+
+RouteTaken RouteOf(const header_parser::HeaderReport& header) {
+    const std::string refused = header.WhyOfNoUse();
+    return {refused.empty() ? route::kHeader : route::kLibrary, refused};
+}
+
+RouteTaken RouteOf(const std::filesystem::path& movie) {
+    return RouteOf(header_parser::InspectHeaders(movie));
+}
 
 void TellRoute(const std::filesystem::path& movie, int verbosity) {
     const RouteTaken taken = verbosity > 0 ? RouteOf(movie) : RouteTaken{};
@@ -23,6 +31,15 @@ void AddRoute(const std::filesystem::path& movie, nlohmann::ordered_json& json) 
     json["route"] = taken.route;
     if (!taken.reason.empty()) {
         json["routeReason"] = taken.reason;
+    }
+}
+
+void AddProblemOrRoute(const Problem& problem, const std::filesystem::path& movie,
+                       nlohmann::ordered_json& json) {
+    if (problem) {
+        AddProblem(problem, json);
+    } else {
+        AddRoute(movie, json);
     }
 }
 

@@ -27,8 +27,16 @@ struct SamplesOptions {
     bool json = false;
 };
 
-// Shows the maps of tracks: each sample of a picture track, but only the runs of a
-// sound track, whose samples are many and alike.
+// What is shown of a track but for its samples, which may be more than memory
+// holds: they are read while they are shown.
+struct TrackMap {
+    const ClipTrack& track;
+    RunMap runs;
+    std::optional<ncfUInt32> channels;  // of sound that can be delivered
+};
+
+// Shows the maps of tracks: each sample of a picture, the runs of a sound, whose
+// samples are many and alike.
 class SamplesRun {
 public:
     SamplesRun(Essence& essence, const SamplesOptions& options)
@@ -40,15 +48,19 @@ public:
     int Run();
 
 private:
-    void ShowTrack(const ClipTrack& track);
-    void ShowSamples(const ClipTrack& track, std::uint64_t count, Json& json);
-    void ShowRuns(const RunMap& runs, Json& json);
-    void ShowSums(const ClipTrack& track, const RunMap& runs, Json& json);
+    TrackMap Read(const ClipTrack& track);
+    bool ShowsRuns(const TrackMap& map) const {
+        return map.track.kind == TrackKind::Sound && !options_.every;
+    }
+    template <class Each>
+    void ReadSamples(const TrackMap& map, const Each& each);
+    Json ToJson(const TrackMap& map);
+    void Print(const TrackMap& map);
+    void PrintSums(const RunMap& runs);
 
     Essence& essence_;
     const SamplesOptions& options_;
     std::uint64_t fileSize_ = 0;
-    Json tracks_ = Json::array();
     Problem wrong_;  // the first thing of all that is
 };
 
@@ -57,82 +69,110 @@ std::string OffsetText(const MappedSample& sample) {
 }
 
 Json ToJson(const MappedSample& sample) {
-    Json json = {{"sample", sample.number}, {"position", sample.position}, {"size", sample.size}};
-    if (sample.temporalOffset) {
-        json["temporalOffset"] = *sample.temporalOffset;
-    } else {
-        json["temporalOffset"] = nullptr;
-    }
-    json["properties"] = sample.properties;
-    json["dependencies"] = sample.dependencies;
-    json["contiguousSamples"] = sample.contiguousSamples;
-    json["contiguousBytes"] = sample.contiguousBytes;
-    return json;
+    return {{"sample", sample.number},
+            {"position", sample.position},
+            {"size", sample.size},
+            {"temporalOffset", sample.temporalOffset ? Json(*sample.temporalOffset) : Json()},
+            {"properties", sample.properties},
+            {"dependencies", sample.dependencies},
+            {"contiguousSamples", sample.contiguousSamples},
+            {"contiguousBytes", sample.contiguousBytes}};
 }
 
-void SamplesRun::ShowSamples(const ClipTrack& track, std::uint64_t count, Json& json) {
-    constexpr std::uint64_t kStep = 1024;  // samples between two looks at the bar
-    Progress progress("samples", static_cast<std::size_t>(count / kStep + 1));
-    if (!options_.json) {
-        fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", "sample", "position", "size",
-                   "offset", "properties", "contiguous bytes");
-    }
-    TemporalOffsets offsets(essence_.map(), track.number, [&] {
-        return DisplayTimesOf(essence_.movie(), essence_.Which(track));
-    });
-    for (std::uint64_t i = 0; i < count; ++i) {
-        if (i % kStep == 0) {
-            progress.Step(fmt::format("{}", i));
-        }
-        MappedSample sample;
-        const NCFRESULT result =
-            ReadMappedSample(essence_.map(), track.number, i, sample, &offsets);
-        if (result < 0) {
-            essence_.Fail(fmt::format("track {}: sample {} can't be mapped", track.number, i),
-                          result);
-        }
-        if (options_.json) {
-            json["map"].push_back(ToJson(sample));
-        } else {
-            fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", i, sample.position, sample.size,
-                       OffsetText(sample), WordsForProperties(sample.properties),
-                       sample.contiguousBytes);
-        }
-    }
+Json ToJson(const SampleRun& run) {
+    return {{"first", run.first},
+            {"count", run.count},
+            {"position", run.position},
+            {"bytes", run.bytes}};
 }
 
-void SamplesRun::ShowRuns(const RunMap& runs, Json& json) {
-    if (!options_.json) {
-        fmt::print("  {:>10} {:>10} {:>14} {:>12}\n", "from", "samples", "position", "bytes");
+TrackMap SamplesRun::Read(const ClipTrack& track) {
+    TrackMap map{track, ReadRuns(essence_.map(), track.number, fileSize_), {}};
+    const RunMap& runs = map.runs;
+    essence_.Check(runs.result, track, "its samples can't be mapped");
+    ncfUInt32 channels = 0;
+    if (track.kind == TrackKind::Sound && !essence_.Obstacle(track) &&
+        essence_.map().GetNumberOfChannels(track.number, &channels) >= 0) {
+        map.channels = channels;
     }
-    for (const SampleRun& run : runs.runs) {
-        if (options_.json) {
-            json["runs"].push_back({{"first", run.first},
-                                    {"count", run.count},
-                                    {"position", run.position},
-                                    {"bytes", run.bytes}});
-        } else {
-            fmt::print("  {:>10} {:>10} {:>14} {:>12}\n", run.first, run.count, run.position,
-                       run.bytes);
-        }
-    }
-}
-
-void SamplesRun::ShowSums(const ClipTrack& track, const RunMap& runs, Json& json) {
     if (!wrong_ && !runs.faults.empty()) {
         wrong_ = essence_.WhyUnread(track, std::max<std::uint64_t>(runs.samples, 1) - 1, NCF_OK);
         const bool isKnown = !wrong_.hint.empty();
         wrong_.reason = isKnown ? wrong_.reason
                                 : fmt::format("track {}: {}", track.number, runs.faults.front());
     }
-    if (options_.json) {
-        json["bytes"] = runs.bytes;
-        json["faults"] = runs.faults;
+    return map;
+}
+
+template <class Each>
+void SamplesRun::ReadSamples(const TrackMap& map, const Each& each) {
+    constexpr std::uint64_t kStep = 1024;  // samples between two looks at the bar
+    const ncfUInt32 track = map.track.number;
+    Progress progress("samples", static_cast<std::size_t>(map.runs.samples / kStep + 1));
+    TemporalOffsets offsets(essence_.map(), track, [&] {
+        return DisplayTimesOf(essence_.movie(), essence_.Which(map.track));
+    });
+    for (std::uint64_t i = 0; i < map.runs.samples; ++i) {
+        if (i % kStep == 0) {
+            progress.Step(fmt::format("{}", i));
+        }
+        MappedSample sample;
+        const NCFRESULT result = ReadMappedSample(essence_.map(), track, i, sample, &offsets);
+        if (result < 0) {
+            essence_.Fail(fmt::format("track {}: sample {} can't be mapped", track, i), result);
+        }
+        each(sample);
+    }
+}
+
+Json SamplesRun::ToJson(const TrackMap& map) {
+    Json json = {{"track", map.track.number},
+                 {"kind", NameOf(map.track.kind)},
+                 {"samples", map.runs.samples}};
+    if (map.channels) {
+        json["channels"] = *map.channels;
+    }
+    Json list = Json::array();
+    if (ShowsRuns(map)) {
+        for (const SampleRun& run : map.runs.runs) {
+            list.push_back(cliphost::ToJson(run));
+        }
+    } else {
+        ReadSamples(map,
+                    [&](const MappedSample& sample) { list.push_back(cliphost::ToJson(sample)); });
+    }
+    json[ShowsRuns(map) ? "runs" : "map"] = std::move(list);
+    json["bytes"] = map.runs.bytes;
+    json["faults"] = map.runs.faults;
+    return json;
+}
+
+void SamplesRun::Print(const TrackMap& map) {
+    fmt::print("track {}: {}, {}{}\n", map.track.number, NameOf(map.track.kind),
+               Counted(map.runs.samples, "sample"),
+               map.channels ? " of " + Counted(*map.channels, "channel") : "");
+    if (map.runs.samples == 0) {
         return;
     }
-    if (runs.samples == 0) {
-        return;
+    if (ShowsRuns(map)) {
+        fmt::print("  {:>10} {:>10} {:>14} {:>12}\n", "from", "samples", "position", "bytes");
+        for (const SampleRun& run : map.runs.runs) {
+            fmt::print("  {:>10} {:>10} {:>14} {:>12}\n", run.first, run.count, run.position,
+                       run.bytes);
+        }
+    } else {
+        fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", "sample", "position", "size",
+                   "offset", "properties", "contiguous bytes");
+        ReadSamples(map, [](const MappedSample& sample) {
+            fmt::print("  {:>8} {:>14} {:>10} {:>8}  {:<17} {}\n", sample.number, sample.position,
+                       sample.size, OffsetText(sample), WordsForProperties(sample.properties),
+                       sample.contiguousBytes);
+        });
     }
+    PrintSums(map.runs);
+}
+
+void SamplesRun::PrintSums(const RunMap& runs) {
     fmt::print("  {} in {}; the file has {}\n", Counted(runs.bytes, "byte"),
                Counted(runs.runs.size(), "run"), Counted(fileSize_, "byte"));
     for (const std::string& fault : runs.faults) {
@@ -143,57 +183,33 @@ void SamplesRun::ShowSums(const ClipTrack& track, const RunMap& runs, Json& json
     }
 }
 
-void SamplesRun::ShowTrack(const ClipTrack& track) {
-    const RunMap runs = ReadRuns(essence_.map(), track.number, fileSize_);
-    if (runs.result < 0) {
-        essence_.Fail(fmt::format("track {}: its samples can't be mapped", track.number),
-                      runs.result);
-    }
-    ncfUInt32 channels = 0;
-    Json json = {{"track", track.number}, {"kind", NameOf(track.kind)}, {"samples", runs.samples}};
-    const bool hasChannels = track.kind == TrackKind::Sound && !essence_.Obstacle(track) &&
-                             essence_.map().GetNumberOfChannels(track.number, &channels) >= 0;
-    if (hasChannels) {
-        json["channels"] = channels;
-    }
-    if (!options_.json) {
-        fmt::print("track {}: {}, {}{}\n", track.number, NameOf(track.kind),
-                   Counted(runs.samples, "sample"),
-                   hasChannels ? " of " + Counted(channels, "channel") : "");
-    }
-    if (runs.samples == 0) {
-        json[track.kind == TrackKind::Sound && !options_.every ? "runs" : "map"] = Json::array();
-    } else if (track.kind == TrackKind::Sound && !options_.every) {
-        ShowRuns(runs, json);
-    } else {
-        ShowSamples(track, runs.samples, json);
-    }
-    ShowSums(track, runs, json);
-    tracks_.push_back(std::move(json));
-}
-
 int SamplesRun::Run() {
     if (!options_.json) {
         fmt::print("{}\n", host::DisplayPath(options_.movie));
     }
+    Json tracks = Json::array();
+    bool isThere = false;
     for (const ClipTrack& track : essence_.tracks()) {
-        if (!options_.track || *options_.track == track.number) {
-            ShowTrack(track);
+        if (options_.track && *options_.track != track.number) {
+            continue;
+        }
+        isThere = true;
+        const TrackMap map = Read(track);
+        if (options_.json) {
+            tracks.push_back(ToJson(map));
+        } else {
+            Print(map);
         }
     }
-    if (tracks_.empty()) {
+    if (!isThere) {
         throw Failure(kExitCaller, options_.movie,
                       fmt::format("there is no track {}", options_.track.value_or(0)),
                       essence_.TrackList());
     }
     if (options_.json) {
         Json answer = {{"movie", MachinePath(options_.movie)}, {"fileBytes", fileSize_}};
-        if (wrong_ || essence_.undescribed()) {
-            AddProblem(wrong_ ? wrong_ : essence_.undescribed(), answer);
-        } else {
-            AddRoute(options_.movie, answer);
-        }
-        answer["tracks"] = tracks_;
+        AddProblemOrRoute(wrong_ ? wrong_ : essence_.undescribed(), options_.movie, answer);
+        answer["tracks"] = std::move(tracks);
         PrintJson(answer);
     }
     if (wrong_) {

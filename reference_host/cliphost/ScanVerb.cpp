@@ -1,9 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-#include <fmt/format.h>
-
-#include <ctime>
+#include <fmt/chrono.h>
 
 #include "host_interfaces/media/MediaVolume.h"
 #include "host_interfaces/media/PluginComponents.h"
@@ -18,15 +16,6 @@
 
 namespace cliphost {
 namespace {
-
-std::string DateText(ncfUInt32 seconds) {
-    const std::time_t time = seconds;
-    char text[32] = {};
-    struct tm utc {};
-    gmtime_r(&time, &utc);
-    std::strftime(text, sizeof text, "%Y-%m-%dT%H:%M:%SZ", &utc);
-    return text;
-}
 
 struct FolderFacts {
     bool claimed = false;
@@ -78,8 +67,8 @@ nlohmann::ordered_json ToJson(const FolderFacts& facts) {
 }
 
 void Print(const FolderFacts& facts) {
-    fmt::print("claimed: {}, newest movie from {}\n", host::text::Printable(facts.name),
-               DateText(facts.newest));
+    fmt::print("claimed: {}, newest movie from {:%Y-%m-%dT%H:%M:%SZ}\n",
+               host::text::Printable(facts.name), fmt::gmtime(std::time_t{facts.newest}));
     for (const std::filesystem::path& movie : facts.movies) {
         fmt::print("  {}\n", host::DisplayPath(movie));
     }

@@ -16,7 +16,7 @@
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/parameters/RegisterParameterComponents.h"
 #include "reference_host/quicktime/RegisterQuickTimeComponents.h"
-#include "reference_host/util/text/Paths.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
 
 namespace cliphost {
@@ -96,7 +96,7 @@ Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) 
                                : options.plugin;
     std::error_code ignored;
     // The module looks for its data files by the path that it was loaded from.
-    if (host::text::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
+    if (host::system::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
         throw Failure(kExitCaller, BackslashProblem(module));
     }
     host::LoadFailure failure;
@@ -116,16 +116,9 @@ std::vector<std::string> Session::TakeNotices() {
     return std::exchange(notices_, {});
 }
 
-std::vector<std::filesystem::path> Session::MissingDataFiles() const {
-    std::vector<std::filesystem::path> missing;
-    for (const char* const name : {"FourCharMapper.xml", "AAFInfo.xml"}) {
-        const std::filesystem::path file = plugin_->file().parent_path() / name;
-        std::error_code ignored;
-        if (!std::filesystem::exists(std::filesystem::symlink_status(file, ignored))) {
-            missing.push_back(file);
-        }
-    }
-    return missing;
+std::vector<std::filesystem::path> Session::DataFiles() const {
+    const std::filesystem::path folder = plugin_->file().parent_path();
+    return {folder / "FourCharMapper.xml", folder / "AAFInfo.xml"};
 }
 
 Problem BackslashProblem(const std::filesystem::path& path) {
@@ -142,7 +135,7 @@ host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
     if (Problem problem = WhyUnreachable(path)) {
         throw Failure(kExitCaller, std::move(problem));
     }
-    if (host::text::HoldsBackslash(absolute)) {
+    if (host::system::HoldsBackslash(absolute)) {
         throw Failure(kExitCaller, BackslashProblem(path));
     }
     return host::ModulePath(absolute);

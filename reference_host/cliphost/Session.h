@@ -38,8 +38,8 @@ public:
 
     // Lines that the module wrote for the user since the last call.
     std::vector<std::string> TakeNotices();
-    // Files that the module needs beside it and that are not there.
-    std::vector<std::filesystem::path> MissingDataFiles() const;
+    // The files that the module needs beside it.
+    std::vector<std::filesystem::path> DataFiles() const;
 
 private:
     int verbosity_;

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/InspectHeaders.h"
 #include "reference_host/quicktime/QuickTimeWrapper.h"

@@ -9,7 +9,7 @@
 #include <vector>
 
 #include "host_interfaces/media/SampleMapping.h"
-#include "reference_host/cliphost/MovieDiagnosis.h"
+#include "reference_host/cliphost/HeaderTracks.h"
 
 namespace cliphost {
 

@@ -16,7 +16,13 @@ namespace cliphost {
 
 namespace {
 
-void ShowTypes(Session& session, bool json) {
+struct FileType {
+    std::string extension;
+    std::string description;
+    std::string group;
+};
+
+std::vector<FileType> ReadTypes(Session& session) {
     host::Ref<NMA::IMediaContainer3> container;
     const NCFRESULT made = session.host().Create(NMA::CompID_QuickTimeContainer, container);
     if (made < 0) {
@@ -26,29 +32,37 @@ void ShowTypes(Session& session, bool json) {
                               {},
                               made});
     }
-    nlohmann::ordered_json list = nlohmann::ordered_json::array();
-    const ncfUInt32 count = container->GetFileTypeCount();
-    for (ncfUInt32 i = 0; i < count; ++i) {
+    std::vector<FileType> types(container->GetFileTypeCount());
+    for (std::size_t i = 0; i < types.size(); ++i) {
         host::Ref<INCFString> extension, description, group;
-        const NCFRESULT result =
-            container->GetFileType(i, extension.Out(), description.Out(), group.Out());
+        const NCFRESULT result = container->GetFileType(static_cast<ncfUInt32>(i), extension.Out(),
+                                                        description.Out(), group.Out());
         if (result < 0) {
             throw Failure(kExitCaller,
                           Problem{{}, "the module does not tell its file types", {}, result});
         }
-        if (json) {
-            list.push_back({{"index", i},
-                            {"extension", host::text::ReadUtf8(extension.get())},
-                            {"description", host::text::ReadUtf8(description.get())},
-                            {"group", host::text::ReadUtf8(group.get())}});
-        } else {
-            fmt::print("{:2}  {:<6} {:<12} {}\n", i, host::text::ReadUtf8(extension.get()),
-                       host::text::ReadUtf8(description.get()), host::text::ReadUtf8(group.get()));
-        }
+        types[i] = {host::text::ReadUtf8(extension.get()), host::text::ReadUtf8(description.get()),
+                    host::text::ReadUtf8(group.get())};
     }
-    if (json) {
-        PrintJson(list);
+    return types;
+}
+
+void Print(const std::vector<FileType>& types) {
+    for (std::size_t i = 0; i < types.size(); ++i) {
+        fmt::print("{:2}  {:<6} {:<12} {}\n", i, types[i].extension, types[i].description,
+                   types[i].group);
     }
+}
+
+nlohmann::ordered_json ToJson(const std::vector<FileType>& types) {
+    nlohmann::ordered_json list = nlohmann::ordered_json::array();
+    for (const FileType& type : types) {
+        list.push_back({{"index", list.size()},
+                        {"extension", type.extension},
+                        {"description", type.description},
+                        {"group", type.group}});
+    }
+    return list;
 }
 
 }  // namespace
@@ -61,7 +75,12 @@ void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
     verb->callback([&options, json] {
         AnswerFailureToo(*json, nlohmann::ordered_json::object(), [&] {
             Session session(options);
-            ShowTypes(session, *json);
+            const std::vector<FileType> types = ReadTypes(session);
+            if (*json) {
+                PrintJson(ToJson(types));
+            } else {
+                Print(types);
+            }
         });
     });
 }

@@ -19,4 +19,11 @@ std::string NumberedFromZero(std::uint64_t count, const std::string& thing) {
                       : fmt::format("{}, 0 to {}", text, count - 1);
 }
 
+std::string InSmallLetters(std::string text) {
+    for (char& c : text) {
+        c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+    }
+    return text;
+}
+
 }  // namespace cliphost

@@ -14,4 +14,7 @@ std::string Counted(std::uint64_t count, const std::string& thing);
 // frame 0", "it has 25 frames, 0 to 24".
 std::string NumberedFromZero(std::uint64_t count, const std::string& thing);
 
+// Letters of ASCII alone.
+std::string InSmallLetters(std::string text);
+
 }  // namespace cliphost

@@ -1,42 +1,25 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-#include <fcntl.h>
 #include <fmt/format.h>
-#include <unistd.h>
 
 #include <cerrno>
-#include <csignal>
 #include <cstdio>
 #include <iostream>
 #include <system_error>
 
+#include "host_interfaces/Version.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
+#include "reference_host/cliphost/SettingsOptions.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/system/Process.h"
 #include "reference_host/util/text/Printable.h"
 
 namespace {
-
-std::filesystem::path ProgramFolder(const char* name) {
-    std::error_code error;
-    const std::filesystem::path program = std::filesystem::read_symlink("/proc/self/exe", error);
-    return (error ? std::filesystem::absolute(name) : program).parent_path();
-}
-
-// If the caller closed a standard stream, the next file that is opened would get
-// its number, and what is printed would go into that file.
-void KeepStandardStreams() {
-    for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
-        if (fcntl(stream, F_GETFD) < 0) {
-            // Only errors may be lost; to write results there has to fail.
-            open("/dev/null", stream == STDERR_FILENO ? O_WRONLY : O_RDONLY);
-        }
-    }
-}
 
 void Tell(const std::string& text) {
     cliphost::Notice("cliphost: {}\n", text);
@@ -76,7 +59,7 @@ std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
 int Run(int argc, char** argv) {
     using namespace cliphost;
     SessionOptions session;
-    session.programFolder = ProgramFolder(argv[0]);
+    session.programFolder = host::system::ProgramFile(argv[0]).parent_path();
     int status = kExitFine;
 
     CLI::App app{
@@ -89,45 +72,14 @@ int Run(int argc, char** argv) {
         "Exit status: 0, everything was done; 1, the content of a file is at fault; 2, the call "
         "is at fault:\na wrong option, a file that does not exist, an output that can't be "
         "written. Of several failures\nthe highest counts.");
-    app.set_version_flag("--version", "cliphost 1.3.2");
+    app.set_version_flag("--version", "cliphost " PRODUCT_VERSION_TEXT);
     app.add_flag("-v", session.verbosity,
                  "Show the module's console lines on standard error; -vv shows its log too");
     app.add_option("--plugin", session.plugin,
                    "Use this module file instead of the one beside the program");
     app.add_option("--aaf-library", session.aafLibrary, "Use this build of the AAF library");
 
-    double editorRate = 25.0;
-    double forcedRate = 0.0;
-    ncfUInt32 singleFrameDuration = 60;
-    bool movieHeaderDuration = false;
-    bool useAlpha = false;
-    const char* const settings = "Host and editor settings";
-    app.add_option("--editor-rate", editorRate, "Frames per second of the project")
-        ->check(FrameRate())
-        ->capture_default_str()
-        ->group(settings);
-    auto* const forced = app.add_option("--forced-rate", forcedRate,
-                                        "Frames per second to use instead of a clip's own")
-                             ->check(FrameRate())
-                             ->group(settings);
-    app.add_option("--single-frame-duration", singleFrameDuration,
-                   "Length of one-frame clips, in frames")
-        ->check(SmallWholeNumber())
-        ->capture_default_str()
-        ->group(settings);
-    app.add_flag("--movie-header-duration", movieHeaderDuration,
-                 "Take lengths from the movie header")
-        ->group(settings);
-    app.add_flag("--use-alpha", useAlpha, "Describe alpha channels too")->group(settings);
-    app.parse_complete_callback([&] {
-        session.host.editorFrameRate = editorRate;
-        if (forced->count() > 0) {
-            session.host.forcedFrameRate = forcedRate;
-        }
-        session.host.singleFrameDuration = singleFrameDuration;
-        session.host.movieHeaderDuration = movieHeaderDuration;
-        session.host.ignoreAlpha = !useAlpha;
-    });
+    AddSettings(app, session.host);
 
     AddScan(app, session, status);
     AddDescribe(app, session, status);
@@ -169,8 +121,6 @@ int Run(int argc, char** argv) {
 }  // namespace
 
 int main(int argc, char** argv) {
-    // A file that outgrows its limit fails to be written; the signal would end us.
-    std::signal(SIGXFSZ, SIG_IGN);
-    KeepStandardStreams();
+    host::system::PrepareProcess();
     return FlushOutput(Run(argc, argv));
 }

@@ -2,14 +2,12 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/framework/Capability.h"
 
+#include "reference_host/framework/Guard.h"
+
 namespace host {
 
 NCFRESULT Capability::GetValue(ncfUInt32* value) {
-    if (value == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *value = value_.load(std::memory_order_relaxed);
-    return NCF_OK;
+    return Give(value_.load(std::memory_order_relaxed), value);
 }
 
 void Capability::SetValue(ncfUInt32 value) {

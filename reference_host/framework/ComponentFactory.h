@@ -10,7 +10,7 @@
 
 #include "host_interfaces/framework/ComponentFactory.h"
 #include "reference_host/framework/Component.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 namespace host {
 

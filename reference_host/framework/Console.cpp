@@ -6,25 +6,9 @@
 #include <cstdio>
 
 #include "reference_host/framework/Guard.h"
+#include "reference_host/util/text/Formatted.h"
 
 namespace host {
-
-namespace {
-
-std::string Format(const char* format, va_list arguments) {
-    va_list again;
-    va_copy(again, arguments);
-    const int length = std::vsnprintf(nullptr, 0, format, again);
-    va_end(again);
-    if (length <= 0) {
-        return {};
-    }
-    std::string text(static_cast<std::size_t>(length), '\0');
-    std::vsnprintf(text.data(), text.size() + 1, format, arguments);
-    return text;
-}
-
-}  // namespace
 
 NCFRESULT Console::Write(ncfUInt32 level, const char* format, ...) {
     if (format == nullptr) {
@@ -33,7 +17,7 @@ NCFRESULT Console::Write(ncfUInt32 level, const char* format, ...) {
     va_list arguments;
     va_start(arguments, format);
     const NCFRESULT result = Guarded([&] {
-        Deliver(level, Format(format, arguments));
+        Deliver(level, text::Formatted(format, arguments));
         return NCF_OK;
     });
     va_end(arguments);

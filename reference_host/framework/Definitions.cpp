@@ -15,10 +15,8 @@ namespace {
 // Stores a copy; an id that is set again takes the new value.
 NCFRESULT Store(std::vector<DefinitionAttribute>& attributes, const GUID& id, const GUID& valueType,
                 const void* value, ncfUInt32 bytes) {
-    if (value == nullptr) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
+        Need(value);
         const auto* start = static_cast<const unsigned char*>(value);
         const std::size_t size = bytes == kNCFZeroTerminated
                                      ? std::strlen(static_cast<const char*>(value))
@@ -53,10 +51,8 @@ NCFRESULT PluginDefinition::SetAttribute(const GUID& attribute, const GUID& valu
 NCFRESULT PluginDefinition::Define(const GUID& pluginId, ncfUInt32 major, ncfUInt32 minor,
                                    const char* name, const GUID& secondId, const char* vendor,
                                    ncfUInt32 componentCount, ncfUInt32 last) {
-    if (name == nullptr || vendor == nullptr) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
+        Need(name && vendor);
         facts_.name = name;
         facts_.vendor = vendor;
         facts_.id = pluginId;
@@ -77,10 +73,8 @@ NCFRESULT ComponentDefinition::SetAttribute(const GUID& attribute, const GUID& v
 NCFRESULT ComponentDefinition::Define(const GUID& componentId, const GUID& componentType,
                                       ncfUInt32 major, ncfUInt32 minor, const GUID& classId,
                                       const char* displayName) {
-    if (displayName == nullptr) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
+        Need(displayName);
         facts_.name = displayName;
         facts_.id = componentId;
         facts_.type = componentType;

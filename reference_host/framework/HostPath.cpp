@@ -3,29 +3,27 @@
 #include "reference_host/framework/HostPath.h"
 
 #include "reference_host/framework/Guard.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
-#include "reference_host/util/text/Paths.h"
 #include "reference_host/util/text/Printable.h"
 
 namespace host {
 
 NCFRESULT PathFrom(INCFString* text, std::filesystem::path& out) {
-    if (text == nullptr) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
-        const bool usable = text::ToSystemPath(text::Read(text), out) && !out.empty();
+        Need(text);
+        const bool usable = host::system::ToSystemPath(text::Read(text), out) && !out.empty();
         return usable ? NCF_OK : NCF_E_INVALIDARG;
     });
 }
 
 Ref<String> ModulePath(const std::filesystem::path& path) {
-    return MakeString(text::ToModulePath(path));
+    return MakeString(host::system::ToModulePath(path));
 }
 
 std::string DisplayPath(const std::filesystem::path& path) {
-    return text::Printable(text::ToUtf8Lossy(text::FromSystemPath(path)));
+    return text::Printable(text::ToUtf8Lossy(host::system::FromSystemPath(path)));
 }
 
 }  // namespace host

@@ -18,7 +18,7 @@ namespace host {
 NCFRESULT PathFrom(INCFString* text, std::filesystem::path& out);
 
 // The path as the module wants it. A name that holds a backslash itself has no
-// such form: see text::HoldsBackslash.
+// such form: see host::system::HoldsBackslash.
 Ref<String> ModulePath(const std::filesystem::path& path);
 
 // The path for people, on one line: controls and bytes that are no UTF-8 are

@@ -21,7 +21,7 @@ std::string InHex(NCFRESULT code) {
 }
 
 template <class Function>
-bool FindFunction(const SharedLibrary& library, const char* name, Function& function,
+bool FindFunction(const system::SharedLibrary& library, const char* name, Function& function,
                   std::string& reason) {
     function = reinterpret_cast<Function>(library.Find(name));
     if (function == nullptr) {

@@ -10,7 +10,7 @@
 #include "host_interfaces/framework/PluginEntry.h"
 #include "reference_host/framework/ComponentFactory.h"
 #include "reference_host/framework/Definitions.h"
-#include "reference_host/framework/SharedLibrary.h"
+#include "reference_host/system/SharedLibrary.h"
 
 namespace host {
 
@@ -70,7 +70,7 @@ private:
     std::filesystem::path file_;
     Ref<INCFUnknown> host_;
     Ref<ComponentFactory> factory_;
-    SharedLibrary library_;
+    host::system::SharedLibrary library_;
     Functions functions_;
     PluginFacts plugin_;
     std::vector<ComponentFacts> components_;

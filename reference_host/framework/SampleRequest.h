@@ -5,7 +5,7 @@
 #include "host_interfaces/framework/AVBuffer.h"
 #include "reference_host/framework/Buffer.h"
 #include "reference_host/framework/Component.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 namespace host {
 

@@ -22,28 +22,18 @@ NCFRESULT Settings::GetHostSettingBoolean(const GUID& setting, ncfUInt32 scope, 
     return NCF_E_PARAMETERNOTAVAILABLE;
 }
 
-NCFRESULT Settings::GetEditorFrameRate(double* rate, ncfUInt32*, ncfUInt32*) {
-    if (rate == nullptr) {
-        return NCF_E_POINTER;
-    }
+template <class Value>
+NCFRESULT Settings::GiveKnown(const std::optional<Value>& value, Value* out) {
     const std::lock_guard<std::mutex> guard(mutex_);
-    if (!editorFrameRate_) {
-        return NCF_E_PARAMETERNOTAVAILABLE;
-    }
-    *rate = *editorFrameRate_;
-    return NCF_OK;
+    return out != nullptr && !value ? NCF_E_PARAMETERNOTAVAILABLE : Give(value.value_or(0), out);
+}
+
+NCFRESULT Settings::GetEditorFrameRate(double* rate, ncfUInt32*, ncfUInt32*) {
+    return GiveKnown(editorFrameRate_, rate);
 }
 
 NCFRESULT Settings::GetSingleFrameDuration(ncfUInt32* duration) {
-    if (duration == nullptr) {
-        return NCF_E_POINTER;
-    }
-    const std::lock_guard<std::mutex> guard(mutex_);
-    if (!singleFrameDuration_) {
-        return NCF_E_PARAMETERNOTAVAILABLE;
-    }
-    *duration = *singleFrameDuration_;
-    return NCF_OK;
+    return GiveKnown(singleFrameDuration_, duration);
 }
 
 NCFRESULT Settings::GetForcedFrameRate(ncfUInt32* enabled, double* rate) {
@@ -57,15 +47,11 @@ NCFRESULT Settings::GetForcedFrameRate(ncfUInt32* enabled, double* rate) {
 }
 
 NCFRESULT Settings::GetNamedSetting(const ncfUTF8* key, ncfUInt32* value, ncfUInt64*, void*) {
-    if (key == nullptr || value == nullptr) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
+        Need(key && value);
         const std::lock_guard<std::mutex> guard(mutex_);
         const auto found = named_.find(key);
-        if (found == named_.end()) {
-            return NCF_E_PARAMETERNOTAVAILABLE;
-        }
+        Need(found != named_.end(), NCF_E_PARAMETERNOTAVAILABLE);
         *value = found->second;
         return NCF_OK;
     });

@@ -40,6 +40,9 @@ public:
     void SetBoolean(const GUID& setting, ncfUInt32 scope, std::optional<bool> value);
 
 private:
+    template <class Value>
+    NCFRESULT GiveKnown(const std::optional<Value>& value, Value* out);
+
     struct Flag {
         GUID setting;
         ncfUInt32 scope;

@@ -14,14 +14,10 @@ namespace {
 
 // The caller's units, counted where they end with a zero.
 template <class Unit>
-NCFRESULT View(const Unit* text, ncfUInt32 units, std::basic_string_view<Unit>& view) {
-    if (text == nullptr) {
-        view = {};
-        return units == 0 ? NCF_OK : NCF_E_POINTER;
-    }
-    view = units == kNCFZeroTerminated ? std::basic_string_view<Unit>(text)
-                                       : std::basic_string_view<Unit>(text, units);
-    return NCF_OK;
+std::basic_string_view<Unit> View(const Unit* text, ncfUInt32 units) {
+    return text == nullptr               ? std::basic_string_view<Unit>()
+           : units == kNCFZeroTerminated ? std::basic_string_view<Unit>(text)
+                                         : std::basic_string_view<Unit>(text, units);
 }
 
 template <class Text, class Variant>
@@ -93,35 +89,29 @@ NCFRESULT String::SetText(std::u32string_view text, ncfUInt32 encoding) {
 
 NCFRESULT String::Assign(INCFString* source) {
     return Guarded([&]() -> NCFRESULT {
-        if (source == nullptr) {
-            return NCF_E_POINTER;
-        }
+        Need(source);
         return SetText(text::Read(source), source->GetEncoding());
     });
 }
 
-NCFRESULT String::AssignUTF8(ncfUInt32 keepAs, const ncfUTF8* text, ncfUInt32 units) {
-    return Guarded([&]() -> NCFRESULT {
-        std::string_view view;
-        const NCFRESULT result = View(text, units, view);
-        return result < 0 ? result : SetText(text::FromUtf8(view), keepAs);
+template <class Unit, class Decode>
+NCFRESULT String::AssignUnits(ncfUInt32 keepAs, const Unit* text, ncfUInt32 units, Decode decode) {
+    return Guarded([&] {
+        Need(text != nullptr || units == 0);
+        return SetText(decode(View(text, units)), keepAs);
     });
+}
+
+NCFRESULT String::AssignUTF8(ncfUInt32 keepAs, const ncfUTF8* text, ncfUInt32 units) {
+    return AssignUnits(keepAs, text, units, text::FromUtf8);
 }
 
 NCFRESULT String::AssignUTF16(ncfUInt32 keepAs, const ncfUTF16* text, ncfUInt32 units) {
-    return Guarded([&]() -> NCFRESULT {
-        std::u16string_view view;
-        const NCFRESULT result = View(text, units, view);
-        return result < 0 ? result : SetText(text::FromUtf16(view), keepAs);
-    });
+    return AssignUnits(keepAs, text, units, text::FromUtf16);
 }
 
 NCFRESULT String::AssignWCHAR(ncfUInt32 keepAs, const ncfWCHAR* text, ncfUInt32 units) {
-    return Guarded([&]() -> NCFRESULT {
-        std::wstring_view view;
-        const NCFRESULT result = View(text, units, view);
-        return result < 0 ? result : SetText(text::FromWide(view), keepAs);
-    });
+    return AssignUnits(keepAs, text, units, text::FromWide);
 }
 
 NCFRESULT String::ConvertTo(ncfUInt32 encoding) {
@@ -132,11 +122,9 @@ NCFRESULT String::ConvertTo(ncfUInt32 encoding) {
 }
 
 NCFRESULT String::ConvertCopy(ncfUInt32 encoding, INCFString** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
     return Guarded([&] {
+        Need(out);
+        *out = nullptr;
         Ref<String> copy = MakeRef<String>();
         const NCFRESULT result = copy->SetText(Text(), encoding);
         if (result >= 0) {
@@ -172,26 +160,22 @@ Ref<String> MakeString(std::string_view utf8, ncfUInt32 encoding) {
     return MakeString(text::FromUtf8(utf8), encoding);
 }
 
-NCFRESULT GiveString(std::u32string_view text, INCFString** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
+template <class Text>
+static NCFRESULT GiveMade(Text text, INCFString** out) {
     return Guarded([&] {
+        Need(out);
+        *out = nullptr;
         *out = MakeString(text).Detach();
         return NCF_OK;
     });
 }
 
+NCFRESULT GiveString(std::u32string_view text, INCFString** out) {
+    return GiveMade(text, out);
+}
+
 NCFRESULT GiveString(std::string_view utf8, INCFString** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
-    return Guarded([&] {
-        *out = MakeString(utf8).Detach();
-        return NCF_OK;
-    });
+    return GiveMade(utf8, out);
 }
 
 }  // namespace host

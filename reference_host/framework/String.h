@@ -8,7 +8,7 @@
 
 #include "host_interfaces/framework/String.h"
 #include "reference_host/framework/Component.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 namespace host {
 
@@ -40,6 +40,9 @@ public:
     NCFRESULT SetText(std::u32string_view text, ncfUInt32 encoding);
 
 private:
+    template <class Unit, class Decode>
+    NCFRESULT AssignUnits(ncfUInt32 keepAs, const Unit* text, ncfUInt32 units, Decode decode);
+
     // ASCII and UTF-8 share the first.
     using Units = std::variant<std::string, std::u16string, std::u32string, std::wstring>;
 

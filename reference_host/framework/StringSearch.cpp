@@ -34,10 +34,8 @@ ncfSInt32 Place(std::size_t at) {
 
 NCFRESULT String::FindCharacter(ncfUTF32 character, ncfSInt32 from, ncfBool forward,
                                 ncfSInt32* at) {
-    if (at == nullptr) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
+        Need(at);
         *at = std::visit(
             [&](const auto& text) -> ncfSInt32 {
                 std::decay_t<decltype(text)> wanted;

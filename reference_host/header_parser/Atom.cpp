@@ -26,37 +26,39 @@ bool AtomList::Stop(bool broken) {
     return false;
 }
 
+AtomHead::AtomHead(ByteReader& reader) {
+    size = reader.U32();
+    type = reader.U32();
+    if (size == 1) {
+        size = reader.U64();
+        length = 16;
+    }
+    isWhole = !reader.Failed();
+}
+
 bool AtomList::Next(Atom& atom) {
     const ncfUInt64 left = reader_.Left();
     if (left == 0) {
         return false;
     }
     const ncfUInt8* const start = reader_.At();
-    if (left < 4) {
-        stoppedAt_ = start;
-        left_ = left;
-        return Stop(true);
-    }
-    const ncfUInt32 shortSize = reader_.U32();
-    if (shortSize == 0) {
+    if (left >= 4 && LoadU32(start) == 0) {
         closed_ = true;
         stoppedAt_ = start;
         return Stop(false);
     }
-    atom.type = reader_.U32();
-    const bool isLarge = shortSize == 1;
-    const ncfUInt64 size = isLarge ? reader_.U64() : shortSize;
-    const ncfUInt64 headerSize = isLarge ? 16 : 8;
-    if (reader_.Failed() || size < headerSize || size > left) {
+    const AtomHead head(reader_);
+    if (!head.isWhole || head.size < head.length || head.size > left) {
         stoppedAt_ = start;
         left_ = left;
-        stoppedType_ = atom.type;
-        claimed_ = size;
+        stoppedType_ = head.type;
+        claimed_ = head.size;
         return Stop(true);
     }
+    atom.type = head.type;
     atom.start = start;
     atom.begin = reader_.At();
-    reader_.Skip(size - headerSize);
+    reader_.Skip(head.size - head.length);
     atom.end = reader_.At();
     return true;
 }

@@ -13,6 +13,20 @@ namespace header_parser {
 std::string NameOf(ncfUInt32 type);
 std::string PlainNameOf(ncfUInt32 type);  // without the quotes
 
+// What an atom begins with: size and type, and behind a size of 1 the true one in
+// 64 bits.
+struct AtomHead {
+    explicit AtomHead(ByteReader& reader);
+
+    bool isWhole = false;  // no less was left
+    ncfUInt32 type = 0;
+    ncfUInt64 length = 8;  // its own
+    ncfUInt64 size = 0;    // that the atom claims
+
+    // The atom ends where what holds it does.
+    bool IsOpen() const { return size == 0 && length == 8; }
+};
+
 // An atom within the header: its type and the bytes behind its own header.
 struct Atom {
     ncfUInt32 type = 0;

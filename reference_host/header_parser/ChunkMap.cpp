@@ -48,39 +48,24 @@ Verdict ChunkMap::OpenPositions(const Atom& stco, const Atom& co64) {
     }
     isLarge_ = !stco;
     const Atom& atom = isLarge_ ? co64 : stco;
-    ByteReader reader(atom.begin, atom.end);
-    reader.Skip(4);
-    chunkCount_ = reader.U32();
-    positions_ = reader.At();
-    if (reader.Failed()) {
-        return CutShort(atom);
-    }
-    if (chunkCount_ > reader.Left() / (isLarge_ ? 8 : 4)) {
-        return ClaimsTooMany(atom, chunkCount_, reader.Left());
-    }
-    return chunkCount_ > 0
+    const Verdict verdict = OpenTable(atom, isLarge_ ? 8 : 4, positions_, chunkCount_);
+    return verdict.Refused() ? verdict
+           : chunkCount_ > 0
                ? Fine()
                : Broken(atom, fmt::format("{} holds no chunk, the track has {}", NameOf(atom.type),
                                           Counted(sampleCount_, "sample")));
 }
 
 Verdict ChunkMap::ReadRuns(const Atom& stsc, ncfUInt32 descriptions) {
-    ByteReader reader(stsc.begin, stsc.end);
-    reader.Skip(4);
-    runCount_ = reader.U32();
-    runs_ = reader.At();
     if (!stsc) {
         return Broken("it lacks 'stsc', the samples of its chunks");
     }
-    if (reader.Failed()) {
-        return CutShort(stsc);
+    if (Verdict verdict = OpenTable(stsc, 12, runs_, runCount_); verdict.Refused()) {
+        return verdict;
     }
     if (runCount_ == 0) {
         return Broken(stsc, fmt::format("'stsc' is empty, the track has {}",
                                         Counted(sampleCount_, "sample")));
-    }
-    if (runCount_ > reader.Left() / 12) {
-        return ClaimsTooMany(stsc, runCount_, reader.Left());
     }
     if (Field(0, 0) != 1) {
         return Broken(stsc, fmt::format("'stsc' begins with chunk {}, not with 1", Field(0, 0)));

@@ -9,27 +9,18 @@
 
 namespace header_parser {
 
-namespace {
+using host::Give;
+using host::Guarded;
+using host::Need;
 
-template <typename Value>
-NCFRESULT Give(Value value, Value* out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = value;
-    return NCF_OK;
-}
+namespace {
 
 // Zeros behind the text are no part of it.
 NCFRESULT GiveText(const Atom& atom, INCFString** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
-    if (!atom) {
-        return NCF_E_PARAMETERNOTAVAILABLE;
-    }
-    return host::Guarded([&] {
+    return Guarded([&] {
+        Need(out);
+        *out = nullptr;
+        Need(atom, NCF_E_PARAMETERNOTAVAILABLE);
         const std::string_view all(reinterpret_cast<const char*>(atom.begin),
                                    static_cast<std::size_t>(atom.Size()));
         return host::GiveString(all.substr(0, all.find('\0')), out);
@@ -52,25 +43,17 @@ NCFRESULT VideoDescriptionObject::GetEncodedWidthAndHeight(ncfUInt16* width, ncf
 }
 
 NCFRESULT VideoDescriptionObject::HasAlpha(ncfSInt32* hasAlpha) {
-    return Give<ncfSInt32>(description_->hasAlpha ? 1 : 0, hasAlpha);
+    return Give(description_->hasAlpha, hasAlpha);
 }
 
 NCFRESULT VideoDescriptionObject::GetFieldInfo(ncfUInt32* fieldCount, ncfUInt32* topFieldFirst,
                                                ncfUInt32* split) {
-    if (fieldCount == nullptr) {
-        return NCF_E_POINTER;
+    if (fieldCount == nullptr || !description_->fields) {
+        return fieldCount == nullptr ? NCF_E_POINTER : NCF_E_PARAMETERNOTAVAILABLE;
     }
-    if (!description_->fields) {
-        return NCF_E_PARAMETERNOTAVAILABLE;
-    }
-    *fieldCount = description_->fields->count;
-    if (topFieldFirst != nullptr) {
-        *topFieldFirst = description_->fields->topFirst ? 1 : 0;
-    }
-    if (split != nullptr) {
-        *split = description_->fields->split ? 1 : 0;
-    }
-    return NCF_OK;
+    Give(description_->fields->topFirst, topFieldFirst);
+    Give(description_->fields->split, split);
+    return Give(description_->fields->count, fieldCount);
 }
 
 NCFRESULT VideoDescriptionObject::GetVendor(ncfUInt32* vendor) {
@@ -121,14 +104,9 @@ NCFRESULT VideoDescriptionObject::GetNivoAlphaCoding(ncfUInt32 index, ncfUInt32*
 }
 
 NCFRESULT VideoDescriptionObject::GetNivoResolution(QTNivoResolution* resolution) {
-    if (resolution == nullptr) {
-        return NCF_E_POINTER;
-    }
-    if (!description_->resolutionId) {
-        return NCF_E_PARAMETERNOTAVAILABLE;
-    }
-    resolution->id = *description_->resolutionId;
-    return NCF_OK;
+    return resolution == nullptr         ? NCF_E_POINTER
+           : !description_->resolutionId ? NCF_E_PARAMETERNOTAVAILABLE
+                                         : Give(*description_->resolutionId, &resolution->id);
 }
 
 NCFRESULT VideoDescriptionObject::GetRIAttributes(INCFString** text) {
@@ -152,11 +130,11 @@ NCFRESULT AudioDescriptionObject::GetSampleRate(double* rate) {
 }
 
 NCFRESULT AudioDescriptionObject::IsConstantBitRate(ncfBool* constant) {
-    return Give<ncfBool>(description_->isConstantBitRate ? 1 : 0, constant);
+    return Give(description_->isConstantBitRate, constant);
 }
 
 NCFRESULT AudioDescriptionObject::IsLPCM(ncfBool* isLPCM) {
-    return Give<ncfBool>(description_->isLinear ? 1 : 0, isLPCM);
+    return Give(description_->isLinear, isLPCM);
 }
 
 NCFRESULT AudioDescriptionObject::GetBytesPerPacket(ncfUInt32* bytes) {
@@ -164,7 +142,7 @@ NCFRESULT AudioDescriptionObject::GetBytesPerPacket(ncfUInt32* bytes) {
 }
 
 NCFRESULT AudioDescriptionObject::IsLittleEndian(ncfBool* littleEndian) {
-    return Give<ncfBool>(description_->isLittleEndian ? 1 : 0, littleEndian);
+    return Give(description_->isLittleEndian, littleEndian);
 }
 
 }  // namespace header_parser

@@ -5,7 +5,7 @@
 #include <algorithm>
 #include <cstring>
 
-#include "reference_host/header_parser/LargeBlock.h"
+#include "reference_host/system/LargeBlock.h"
 
 namespace header_parser {
 
@@ -20,7 +20,7 @@ ncfUInt8* HeaderBytes::Room(ncfUInt64 count) {
         if (larger == nullptr) {
             return nullptr;
         }
-        ExpectLargeBlock(larger, wanted);
+        host::system::ExpectLargeBlock(larger, wanted);
         if (size_ > 0) {
             std::memcpy(larger, bytes_.get(), static_cast<std::size_t>(size_));
         }

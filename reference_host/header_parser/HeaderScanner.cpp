@@ -8,7 +8,7 @@
 #include <iterator>
 #include <limits>
 
-#include "reference_host/header_parser/ByteReader.h"
+#include "reference_host/header_parser/Atom.h"
 
 namespace header_parser {
 
@@ -115,19 +115,16 @@ Verdict HeaderScanner::Feed(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt6
 }
 
 Verdict HeaderScanner::Walk(Range& range) {
-    if (range.Left() < 8) {
+    ByteReader reader(range.at, range.end);
+    const AtomHead head(reader);
+    if (!head.isWhole) {
         return Want(cursor_, limits_.scanReadSize);
     }
-    const ncfUInt32 shortSize = LoadU32(range.at);
-    const ncfUInt32 type = LoadU32(range.at + 4);
-    if (shortSize == 0 && type == 0) {
+    const ncfUInt32 type = head.type;
+    const ncfUInt64 size = head.size;
+    if (head.IsOpen() && type == 0) {
         return At(cursor_, NoData("zeros where an atom should begin, before any movie header"));
     }
-    if (shortSize == 1 && range.Left() < 16) {
-        return Want(cursor_, limits_.scanReadSize);
-    }
-    const ncfUInt64 headerSize = shortSize == 1 ? 16 : 8;
-    const ncfUInt64 size = shortSize == 1 ? LoadU64(range.at + 8) : shortSize;
     if (atomsSeen_ == 0 ? !MayOpenAFile(type) && !BelongsToFragments(type) : !IsText(type)) {
         return NoAtomHere(type);
     }
@@ -140,15 +137,15 @@ Verdict HeaderScanner::Walk(Range& range) {
                                                "header",
                                                limits_.maxTopLevelAtoms)));
     }
-    if (shortSize != 0 && (size < headerSize || size > kMaxPosition - cursor_)) {
+    if (!head.IsOpen() && (size < head.length || size > kMaxPosition - cursor_)) {
         return At(cursor_,
                   Broken(fmt::format("{} has the impossible size {}", NameOf(type), size)));
     }
     if (type == Code("moov")) {
-        range.at += headerSize;
-        return EnterHeader(size, headerSize, shortSize == 0);
+        range.at += head.length;
+        return EnterHeader(size, head.length, head.IsOpen());
     }
-    if (shortSize == 0) {
+    if (head.IsOpen()) {
         return At(cursor_,
                   NoData(fmt::format("{} reaches to the end of the file, before any movie header",
                                      NameOf(type))));
@@ -247,22 +244,22 @@ Verdict HeaderScanner::GatherToEnd(Range& range) {
     cursor_ += taken;
     ncfUInt64 childSize = 0;
     while (payload_.Size() - walked_ >= 8) {
-        const ncfUInt8* child = payload_.begin() + walked_;
-        const ncfUInt32 shortSize = LoadU32(child);
-        if (shortSize == 0) {
+        ByteReader reader(payload_.begin() + walked_, payload_.end());
+        const AtomHead child(reader);
+        if (child.IsOpen()) {
             payload_.Shorten(walked_);
             atomSize_ = atomHeaderSize_ + walked_;
             cursor_ = atomPosition_ + atomSize_;
             return Finish();
         }
-        if (shortSize == 1 && payload_.Size() - walked_ < 16) {
+        if (!child.isWhole) {
             break;
         }
-        childSize = shortSize == 1 ? LoadU64(child + 8) : shortSize;
+        childSize = child.size;
         if (childSize < 8 || childSize > limits_.maxHeaderBytes) {
             return At(PayloadPosition() + walked_,
                       Broken(fmt::format("{} in 'moov' has the impossible size {}",
-                                         NameOf(LoadU32(child + 4)), childSize)));
+                                         NameOf(child.type), childSize)));
         }
         if (childSize > payload_.Size() - walked_) {
             break;

@@ -11,6 +11,8 @@
 
 namespace header_parser {
 
+using host::Need;
+
 QTParser::QTParser(const ParserLimits& limits) : limits_(limits), scanner_(limits) {}
 
 NCFRESULT QTParser::ParseHeaders(const ncfUInt8* begin, const ncfUInt8* end, ncfUInt64 position) {
@@ -147,32 +149,25 @@ NCFRESULT QTParser::GetRecomendedReadPosition(ncfUInt64* position, ncfUInt32* si
     return NCF_OK;
 }
 
-template <typename Value>
-NCFRESULT QTParser::Give(Value value, Value* out) const {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = value;
-    return NCF_OK;
+template <typename Value, typename Out>
+NCFRESULT QTParser::Give(Value value, Out* out) const {
+    return state_ == State::kDone ? host::Give(value(*movie_), out) : NMA_E_NOTINITIALIZED;
 }
 
 NCFRESULT QTParser::GetCreationTime(ncfUInt64* seconds) {
-    return state_ == State::kDone ? Give(movie_->creationTime, seconds) : NMA_E_NOTINITIALIZED;
+    return Give([](const Movie& movie) { return movie.creationTime; }, seconds);
 }
 
 NCFRESULT QTParser::GetTimeScale(ncfUInt32* timescale) {
-    return state_ == State::kDone ? Give(movie_->timeScale, timescale) : NMA_E_NOTINITIALIZED;
+    return Give([](const Movie& movie) { return movie.timeScale; }, timescale);
 }
 
 NCFRESULT QTParser::GetMovieDuration(ncfUInt32* duration) {
-    return state_ == State::kDone ? Give(movie_->duration, duration) : NMA_E_NOTINITIALIZED;
+    return Give([](const Movie& movie) { return movie.duration; }, duration);
 }
 
 NCFRESULT QTParser::GiveCount(TrackKind kind, ncfUInt32* count) const {
-    if (state_ != State::kDone) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    return Give(static_cast<ncfUInt32>(movie_->Of(kind).size()), count);
+    return Give([kind](const Movie& movie) { return movie.Of(kind).size(); }, count);
 }
 
 NCFRESULT QTParser::GetVideoTrackCount(ncfUInt32* count) {
@@ -193,17 +188,11 @@ NCFRESULT QTParser::GetOtherTrackCount(ncfUInt32* count) {
 
 template <class Object, class Interface>
 NCFRESULT QTParser::GiveTrack(TrackKind kind, ncfUInt32 index, Interface** out) const {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
-    if (state_ != State::kDone) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (index >= movie_->Of(kind).size()) {
-        return NCF_E_NOTFOUND;
-    }
     return host::Guarded([&] {
+        Need(out);
+        *out = nullptr;
+        Need(state_ == State::kDone, NMA_E_NOTINITIALIZED);
+        Need(index < movie_->Of(kind).size(), NCF_E_NOTFOUND);
         const Track& track = movie_->tracks[movie_->Of(kind)[index]];
         *out = host::MakeRef<Object>(Shared<Track>(movie_, &track), movie_->timeScale).Detach();
         return NCF_OK;
@@ -230,47 +219,36 @@ NCFRESULT QTParser::GetTimeCodeInfo(ncfUInt8* hours, ncfUInt8* minutes, ncfUInt8
                                     ncfUInt8* frames, ncfUInt32* timeScale,
                                     ncfUInt32* frameDuration, ncfUInt32* drop,
                                     ncfUInt32* numFrames) {
-    if (hours == nullptr || minutes == nullptr || seconds == nullptr || frames == nullptr ||
-        timeScale == nullptr || frameDuration == nullptr || drop == nullptr ||
-        numFrames == nullptr) {
-        return NCF_E_POINTER;
-    }
-    if (state_ != State::kDone) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!movie_->startAddress) {
-        return movie_->Of(TrackKind::kTimecode).empty() ? NCF_E_NOTFOUND
-                                                        : NCF_E_PARAMETERNOTAVAILABLE;
-    }
-    const TimecodeDescription& description = TimecodeTrack()->timecode;
-    *hours = movie_->startAddress->hours;
-    *minutes = movie_->startAddress->minutes;
-    *seconds = movie_->startAddress->seconds;
-    *frames = movie_->startAddress->frames;
-    *timeScale = description.timeScale;
-    *frameDuration = description.frameDuration;
-    *drop = description.IsDropFrame() ? 1 : 0;
-    *numFrames = description.numFrames;
-    return NCF_OK;
+    return host::Guarded([&] {
+        Need(hours && minutes && seconds && frames && timeScale && frameDuration && drop &&
+             numFrames);
+        Need(state_ == State::kDone, NMA_E_NOTINITIALIZED);
+        Need(movie_->startAddress, movie_->Of(TrackKind::kTimecode).empty()
+                                       ? NCF_E_NOTFOUND
+                                       : NCF_E_PARAMETERNOTAVAILABLE);
+        const TimecodeDescription& description = TimecodeTrack()->timecode;
+        *hours = movie_->startAddress->hours;
+        *minutes = movie_->startAddress->minutes;
+        *seconds = movie_->startAddress->seconds;
+        *frames = movie_->startAddress->frames;
+        *timeScale = description.timeScale;
+        *frameDuration = description.frameDuration;
+        *drop = description.IsDropFrame() ? 1 : 0;
+        *numFrames = description.numFrames;
+        return NCF_OK;
+    });
 }
 
 NCFRESULT QTParser::IsMovieSelfContained(ncfBool* selfContained) {
-    if (state_ != State::kDone) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    return Give<ncfBool>(movie_->IsSelfContained() ? 1 : 0, selfContained);
+    return Give([](const Movie& movie) { return movie.IsSelfContained(); }, selfContained);
 }
 
 NCFRESULT QTParser::GetMOOVAtom(ncfUInt64* position, ncfUInt64* size) {
     if (position == nullptr || size == nullptr) {
         return NCF_E_POINTER;
     }
-    if (state_ != State::kDone) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    *position = movie_->atomPosition;
-    *size = movie_->atomSize;
-    return NCF_OK;
+    Give([](const Movie& movie) { return movie.atomPosition; }, position);
+    return Give([](const Movie& movie) { return movie.atomSize; }, size);
 }
 
 host::Maker QTParserMaker(const ParserLimits& limits) {

@@ -62,8 +62,9 @@ private:
     NCFRESULT GiveCount(TrackKind kind, ncfUInt32* count) const;
     template <class Object, class Interface>
     NCFRESULT GiveTrack(TrackKind kind, ncfUInt32 index, Interface** out) const;
-    template <typename Value>
-    NCFRESULT Give(Value value, Value* out) const;
+    // value(movie) of a movie that is read.
+    template <typename Value, typename Out>
+    NCFRESULT Give(Value value, Out* out) const;
 
     ParserLimits limits_;
     HeaderScanner scanner_;

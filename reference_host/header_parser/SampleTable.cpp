@@ -43,19 +43,12 @@ Verdict SampleTable::Read(const SampleTableAtoms& atoms, const PacketLayout& old
 }
 
 Verdict SampleTable::NumberList::Read(const Atom& atom, ncfUInt32 sampleCount) {
-    ByteReader reader(atom.begin, atom.end);
-    reader.Skip(4);
-    count = reader.U32();
-    numbers = reader.At();
-    if (reader.Failed()) {
-        return CutShort(atom);
-    }
-    if (count > reader.Left() / 4) {
-        return ClaimsTooMany(atom, count, reader.Left());
+    if (Verdict verdict = OpenTable(atom, 4, numbers, count); verdict.Refused()) {
+        return verdict;
     }
     ncfUInt32 last = 0;
     for (ncfUInt32 i = 0; i < count; ++i) {
-        const ncfUInt32 number = reader.U32();
+        const ncfUInt32 number = LoadU32(numbers + ncfUInt64{4} * i);
         if (number <= last) {
             return Broken(atom, fmt::format("the numbers in {} do not rise: {} comes after {}",
                                             NameOf(atom.type), number, last));

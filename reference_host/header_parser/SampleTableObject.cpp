@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/header_parser/SampleTableObject.h"
 
+#include "reference_host/framework/Guard.h"
+
 namespace header_parser {
 
 template <typename Value, typename Read>
@@ -17,11 +19,7 @@ NCFRESULT SampleTableObject::ForSample(ncfUInt64 sample, Value* out, Read read) 
 }
 
 NCFRESULT SampleTableObject::GetNumSamples(ncfUInt64* numSamples) {
-    if (numSamples == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *numSamples = table_->Count();
-    return NCF_OK;
+    return host::Give(table_->Count(), numSamples);
 }
 
 NCFRESULT SampleTableObject::GetDataOffset(ncfUInt64 sample, ncfUInt64* position) {
@@ -58,19 +56,11 @@ NCFRESULT SampleTableObject::GetDecodeDuration(ncfUInt64 sample, ncfSInt64* dura
 }
 
 NCFRESULT SampleTableObject::GetMaxDataSizeInBytes(ncfUInt32* bytes) {
-    if (bytes == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *bytes = table_->Count() == 0 ? 0 : table_->Sizes().Largest();
-    return NCF_OK;
+    return host::Give(table_->Count() == 0 ? 0 : table_->Sizes().Largest(), bytes);
 }
 
 NCFRESULT SampleTableObject::GetHasOutOfOrderFrameDependencies(ncfBool* outOfOrder) {
-    if (outOfOrder == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *outOfOrder = table_->Times().IsReordered() ? 1 : 0;
-    return NCF_OK;
+    return host::Give(table_->Times().IsReordered(), outOfOrder);
 }
 
 NCFRESULT SampleTableObject::GetChunkFromTheMiddle(ncfUInt64* position, ncfUInt64* size) {
@@ -88,15 +78,9 @@ NCFRESULT SampleTableObject::GetChunkFromTheMiddle(ncfUInt64* position, ncfUInt6
 }
 
 NCFRESULT SampleTableObject::DisplayTimeToFrameNum(ncfUInt64 displayTime, ncfUInt64* sample) {
-    if (sample == nullptr) {
-        return NCF_E_POINTER;
-    }
     ncfUInt32 shown = 0;
-    if (!table_->Times().SampleShownAt(displayTime, shown)) {
-        return NMA_E_NODATA;
-    }
-    *sample = ncfUInt64{shown} + 1;
-    return NCF_OK;
+    const bool isShown = sample != nullptr && table_->Times().SampleShownAt(displayTime, shown);
+    return sample != nullptr && !isShown ? NMA_E_NODATA : host::Give(ncfUInt64{shown} + 1, sample);
 }
 
 }  // namespace header_parser

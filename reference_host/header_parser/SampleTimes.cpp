@@ -19,18 +19,6 @@ constexpr ncfUInt32 kStep = 16;
 
 constexpr ncfUInt64 kMaxTime = static_cast<ncfUInt64>(std::numeric_limits<ncfSInt64>::max()) / 2;
 
-// Opens a table of 8-byte entries behind version, flags and count.
-Verdict OpenTable(const Atom& atom, const ncfUInt8*& entries, ncfUInt32& count) {
-    ByteReader reader(atom.begin, atom.end);
-    reader.Skip(4);
-    count = reader.U32();
-    entries = reader.At();
-    if (reader.Failed()) {
-        return CutShort(atom);
-    }
-    return count <= reader.Left() / 8 ? Fine() : ClaimsTooMany(atom, count, reader.Left());
-}
-
 Verdict CountsOther(const Atom& atom, ncfUInt64 counted, ncfUInt32 sampleCount) {
     return Broken(atom, fmt::format("{} counts {}{}, the track has {}", NameOf(atom.type),
                                     Counted(counted, "sample"),
@@ -58,7 +46,7 @@ Verdict SampleTimes::ReadDurations(const Atom& atom) {
     if (!atom) {
         return Broken("it lacks 'stts', the sample durations");
     }
-    Verdict verdict = OpenTable(atom, durations_, durationEntries_);
+    Verdict verdict = OpenTable(atom, 8, durations_, durationEntries_);
     if (verdict.Refused()) {
         return verdict;
     }
@@ -84,7 +72,7 @@ Verdict SampleTimes::ReadDurations(const Atom& atom) {
 }
 
 Verdict SampleTimes::ReadOffsets(const Atom& atom) {
-    Verdict verdict = OpenTable(atom, offsets_, offsetEntries_);
+    Verdict verdict = OpenTable(atom, 8, offsets_, offsetEntries_);
     if (verdict.Refused()) {
         return verdict;
     }

@@ -164,16 +164,12 @@ Verdict HoldsFewer(const Atom& table, ncfUInt32 claimed, std::size_t held) {
 
 // Which data references are this file itself. Without a table all are.
 Verdict ReadDataReferences(const Atom& dref, std::vector<bool>& isInFile) {
-    ByteReader reader(dref.begin, dref.end);
-    reader.Skip(4);
-    const ncfUInt32 count = reader.U32();
-    if (reader.Failed()) {
-        return CutShort(dref);
+    const ncfUInt8* begin = nullptr;
+    ncfUInt32 count = 0;
+    if (Verdict verdict = OpenTable(dref, 8, begin, count); verdict.Refused()) {
+        return verdict;
     }
-    if (count > reader.Left() / 8) {
-        return ClaimsTooMany(dref, count, reader.Left());
-    }
-    AtomList entries(reader.At(), reader.End());
+    AtomList entries(begin, dref.end);
     Atom entry;
     while (isInFile.size() < count && entries.Next(entry)) {
         const ncfUInt32 flags = entry.Size() >= 4 ? LoadU32(entry.begin) : 0;
@@ -203,24 +199,20 @@ Verdict ReadDescription(const Atom& entry, bool isIso, const ParserLimits& limit
 
 Verdict ReadDescriptions(const Atom& stsd, const std::vector<bool>& references, bool hasReferences,
                          const ParserLimits& limits, Track& track) {
-    ByteReader reader(stsd.begin, stsd.end);
-    const bool isIso = reader.U8() != 0;
-    reader.Skip(3);
-    const ncfUInt32 count = reader.U32();
     if (!stsd) {
         return Broken("it lacks 'stsd', the sample descriptions");
     }
-    if (reader.Failed()) {
-        return CutShort(stsd);
+    const ncfUInt8* begin = nullptr;
+    ncfUInt32 count = 0;
+    if (Verdict verdict = OpenTable(stsd, 16, begin, count); verdict.Refused()) {
+        return verdict;
     }
-    if (count > reader.Left() / 16) {
-        return ClaimsTooMany(stsd, count, reader.Left());
-    }
+    const bool isIso = stsd.begin[0] != 0;
     if (count > limits.maxDescriptionsInTrack) {
         return TooMuch(stsd, fmt::format("'stsd' holds {} sample descriptions, at most {} are read",
                                          count, limits.maxDescriptionsInTrack));
     }
-    AtomList entries(reader.At(), reader.End());
+    AtomList entries(begin, stsd.end);
     Atom entry;
     while (track.isInFile.size() < count && entries.Next(entry)) {
         if (entry.Size() < 8) {

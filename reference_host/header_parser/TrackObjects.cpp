@@ -5,35 +5,26 @@
 #include <algorithm>
 
 #include "reference_host/framework/Guard.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/DescriptionObjects.h"
 #include "reference_host/header_parser/SampleTableObject.h"
+#include "reference_host/util/Ref.h"
 
 namespace header_parser {
 
-namespace {
+using host::Give;
+using host::Guarded;
+using host::Need;
 
-template <typename Value>
-NCFRESULT Give(Value value, Value* out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = value;
-    return NCF_OK;
-}
+namespace {
 
 // A new object over a part of the track, into an interface output.
 template <class Object, class Interface, class Part>
 NCFRESULT GiveObject(const Shared<Track>& track, const std::vector<Part>& parts, ncfUInt32 index,
                      Interface** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
-    if (index >= parts.size()) {
-        return NCF_E_NOTFOUND;
-    }
-    return host::Guarded([&] {
+    return Guarded([&] {
+        Need(out);
+        *out = nullptr;
+        Need(index < parts.size(), NCF_E_NOTFOUND);
         *out = host::MakeRef<Object>(Shared<Part>(track, &parts[index])).Detach();
         return NCF_OK;
     });
@@ -66,15 +57,10 @@ NCFRESULT TrackObject<Interface>::IsTrackLinear(ncfBool* linear,
     if (linear == nullptr || areMediaAndTrackTimesProportional == nullptr) {
         return NCF_E_POINTER;
     }
-    *linear = track_->edits.IsLinear(scales_) ? 1 : 0;
-    *areMediaAndTrackTimesProportional = track_->edits.IsProportional(scales_) ? 1 : 0;
-    if (offset != nullptr) {
-        *offset = track_->edits.Offset();
-    }
-    if (trackTimescale != nullptr) {
-        *trackTimescale = scales_.movie;
-    }
-    return NCF_OK;
+    Give(track_->edits.Offset(), offset);
+    Give(scales_.movie, trackTimescale);
+    Give(track_->edits.IsLinear(scales_), linear);
+    return Give(track_->edits.IsProportional(scales_), areMediaAndTrackTimesProportional);
 }
 
 template <class Interface>
@@ -101,11 +87,9 @@ NCFRESULT TrackObject<Interface>::GetMediaDuration(ncfUInt32* duration) {
 
 template <class Interface>
 NCFRESULT TrackObject<Interface>::GetSampleTable(IQTSampleTable** table) {
-    if (table == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *table = nullptr;
-    return host::Guarded([&] {
+    return Guarded([&] {
+        Need(table);
+        *table = nullptr;
         *table = host::MakeRef<SampleTableObject>(Shared<SampleTable>(track_, &track_->samples))
                      .Detach();
         return NCF_OK;

@@ -29,6 +29,18 @@ Verdict ClaimsTooMany(const Atom& atom, ncfUInt64 entries, ncfUInt64 bytesLeft) 
                                     Counted(entries, "entry"), Counted(bytesLeft, "byte")));
 }
 
+Verdict OpenTable(const Atom& atom, ncfUInt64 entrySize, const ncfUInt8*& entries,
+                  ncfUInt32& count) {
+    ByteReader reader(atom.begin, atom.end);
+    reader.Skip(4);
+    count = reader.U32();
+    entries = reader.At();
+    if (reader.Failed()) {
+        return CutShort(atom);
+    }
+    return count <= reader.Left() / entrySize ? Fine() : ClaimsTooMany(atom, count, reader.Left());
+}
+
 Verdict VerdictOn(const AtomList& atoms, const std::string& parent) {
     std::string reason;
     if (atoms.Broken() && atoms.BytesLeft() < 8) {

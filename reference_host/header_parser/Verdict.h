@@ -60,6 +60,10 @@ std::string Counted(ncfUInt64 number, const char* noun);
 Verdict CutShort(const Atom& atom);
 Verdict OfUnknownVersion(const Atom& atom, unsigned version);
 Verdict ClaimsTooMany(const Atom& atom, ncfUInt64 entries, ncfUInt64 bytesLeft);
+// Finds the entries of the table that an atom holds behind version, flags and their
+// count.
+Verdict OpenTable(const Atom& atom, ncfUInt64 entrySize, const ncfUInt8*& entries,
+                  ncfUInt32& count);
 // What a list of atoms that broke off says of itself; fine for one that did not.
 // Zeros in it are what a header looks like behind the end of a cut file.
 Verdict VerdictOn(const AtomList& atoms, const std::string& parent);

@@ -23,6 +23,9 @@ namespace host {
 //         parameterSet id readOnly  version, name
 //           parameter id            one value element
 
+// The default of a list of choices that has none: no list holds it.
+inline constexpr ncfUInt32 kNoDefault = 0xFFFFFFFFu;
+
 struct ParameterChoice {
     ncfUInt32 value = 0;
     std::string text;

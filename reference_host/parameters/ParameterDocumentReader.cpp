@@ -4,10 +4,10 @@
 #include <cmath>
 #include <cstring>
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "reference_host/framework/Guard.h"
 #include "reference_host/parameters/GuidText.h"
 #include "reference_host/parameters/ParameterDocument.h"
-#include "reference_host/parameters/ParameterNames.h"
 #include "reference_host/parameters/ShownText.h"
 #include "reference_host/xml/EventReader.h"
 #include "reference_host/xml/XmlTree.h"
@@ -16,18 +16,12 @@ namespace host {
 
 namespace {
 
-using namespace parameter_names;
+using namespace NMA;
 
 // What ends the reading.
 struct Refusal {
     NCFRESULT result;
     std::string problem;
-};
-
-class NoEvents final : public XmlEvents {
-public:
-    NCFRESULT OnElement(const char*, const char**) override { return NCF_OK; }
-    NCFRESULT OnText(std::string_view) override { return NCF_OK; }
 };
 
 // "component/track/parameterSet": where a node stands.
@@ -81,7 +75,7 @@ GUID Id(const pugi::xml_node& node, std::string_view text, const char* what) {
 }
 
 GUID IdAttribute(const pugi::xml_node& node) {
-    const pugi::xml_attribute attribute = node.attribute(kId);
+    const pugi::xml_attribute attribute = node.attribute(kParamId);
     if (!attribute) {
         Refuse(node, "has no id");
     }
@@ -99,7 +93,7 @@ ncfUInt32 Number(const pugi::xml_node& node, std::string_view text) {
 }
 
 float Version(const pugi::xml_node& node) {
-    const pugi::xml_node child = node.child(kVersion);
+    const pugi::xml_node child = node.child(kParamVersion);
     if (!child) {
         return 1.0f;
     }
@@ -115,7 +109,7 @@ float Version(const pugi::xml_node& node) {
 }
 
 bool Flag(const pugi::xml_node& node, const char* name) {
-    return std::strcmp(node.attribute(name).value(), kTrue) == 0;
+    return std::strcmp(node.attribute(name).value(), kParamTrue) == 0;
 }
 
 // --- the description -------------------------------------------------------------------
@@ -123,17 +117,18 @@ bool Flag(const pugi::xml_node& node, const char* name) {
 ParameterInfo ReadInfo(const pugi::xml_node& node) {
     ParameterInfo info;
     info.id = IdAttribute(node);
-    info.name = ChildText(node, kShortName);
-    info.label = ChildText(node, kDescription);
-    const pugi::xml_node discrete = node.child(kValueInfo).child(kDiscreteInfo);
-    for (const pugi::xml_node& choice : discrete.children(kDiscrete)) {
-        const char* const name = choice.attribute(kName).value();
+    info.name = ChildText(node, kParamShortName);
+    info.label = ChildText(node, kParamDescription);
+    const pugi::xml_node discrete =
+        node.child(kParamValueInfo).child(kParamKindNames[kParamKindDiscrete].info);
+    for (const pugi::xml_node& choice : discrete.children(kParamDiscrete)) {
+        const char* const name = choice.attribute(kParamName).value();
         if (std::strlen(name) > ParameterLimits::kLongestText) {
             Refuse(choice, "a name that is too long", NCF_E_NOTSUPPORTED);
         }
-        info.choices.push_back({Number(choice, choice.attribute(kValue).value()), name});
+        info.choices.push_back({Number(choice, choice.attribute(kParamValue).value()), name});
     }
-    if (const pugi::xml_attribute value = discrete.attribute(kDefault)) {
+    if (const pugi::xml_attribute value = discrete.attribute(kParamDefault)) {
         const ncfUInt32 number = Number(discrete, value.value());
         if (number != kNoDefault) {
             info.defaultValue = number;
@@ -145,12 +140,12 @@ ParameterInfo ReadInfo(const pugi::xml_node& node) {
 // Groups of groups come out one after the other. Their depth is that of the
 // document, which is bounded.
 void ReadGroups(const pugi::xml_node& parent, std::vector<ParameterGroup>& out) {
-    for (const pugi::xml_node& node : parent.children(kGroup)) {
+    for (const pugi::xml_node& node : parent.children(kParamGroupItem)) {
         ParameterGroup group;
         group.id = IdAttribute(node);
-        group.name = ChildText(node, kShortName);
-        group.isShown = std::strcmp(node.attribute(kDisplayState).value(), kHide) != 0;
-        for (const pugi::xml_node& parameter : node.children(kParameter)) {
+        group.name = ChildText(node, kParamShortName);
+        group.isShown = std::strcmp(node.attribute(kParamDisplayState).value(), kParamHide) != 0;
+        for (const pugi::xml_node& parameter : node.children(kParamItem)) {
             group.parameters.push_back(ReadInfo(parameter));
         }
         out.push_back(std::move(group));
@@ -163,7 +158,8 @@ void ReadGroups(const pugi::xml_node& parent, std::vector<ParameterGroup>& out) 
 ParameterSetting ReadSetting(const pugi::xml_node& node) {
     ParameterSetting setting;
     setting.parameter = IdAttribute(node);
-    for (const char* const name : {kValueUInt32, kValueDiscrete}) {
+    for (const char* const name :
+         {kParamKindNames[kParamKindUInt32].value, kParamKindNames[kParamKindDiscrete].value}) {
         if (const pugi::xml_node value = node.child(name)) {
             setting.value = Number(value, TextOf(value));
             return setting;
@@ -175,11 +171,11 @@ ParameterSetting ReadSetting(const pugi::xml_node& node) {
 ParameterSet ReadSet(const pugi::xml_node& node) {
     ParameterSet set;
     set.id = IdAttribute(node);
-    set.name = ChildText(node, kName);
+    set.name = ChildText(node, kParamName);
     set.version = Version(node);
-    set.isDefault = Flag(node, kDefault);
-    set.isReadOnly = Flag(node, kReadOnly);
-    for (const pugi::xml_node& parameter : node.children(kParameter)) {
+    set.isDefault = Flag(node, kParamDefault);
+    set.isReadOnly = Flag(node, kParamReadOnly);
+    for (const pugi::xml_node& parameter : node.children(kParamItem)) {
         set.settings.push_back(ReadSetting(parameter));
     }
     return set;
@@ -187,32 +183,32 @@ ParameterSet ReadSet(const pugi::xml_node& node) {
 
 ParameterTrack ReadTrack(const pugi::xml_node& node) {
     ParameterTrack track;
-    track.number = Number(node, node.attribute(kNumber).value());
-    if (const pugi::xml_node infos = node.child(kInfos)) {
+    track.number = Number(node, node.attribute(kParamNumber).value());
+    if (const pugi::xml_node infos = node.child(kParamInfos)) {
         track.descriptionVersion = Version(infos);
-        for (const pugi::xml_node& parameter : infos.children(kParameter)) {
+        for (const pugi::xml_node& parameter : infos.children(kParamItem)) {
             track.parameters.push_back(ReadInfo(parameter));
         }
         ReadGroups(infos, track.groups);
     }
-    if (const pugi::xml_node active = node.child(kActiveSet)) {
+    if (const pugi::xml_node active = node.child(kParamActiveSet)) {
         track.activeSet = Id(active, TextOf(active), "the set");
     }
-    for (const pugi::xml_node& set : node.children(kSet)) {
+    for (const pugi::xml_node& set : node.children(kParamSetItem)) {
         track.sets.push_back(ReadSet(set));
     }
     return track;
 }
 
 ParameterDocument ReadRoot(const pugi::xml_node& root) {
-    if (std::strcmp(root.name(), kRoot) != 0) {
-        Refuse(root, std::string("the outermost element of a parameter document is ") + kRoot);
+    if (std::strcmp(root.name(), kParamRoot) != 0) {
+        Refuse(root, std::string("the outermost element of a parameter document is ") + kParamRoot);
     }
     ParameterDocument document;
-    for (const pugi::xml_node& node : root.children(kComponent)) {
+    for (const pugi::xml_node& node : root.children(kParamComponent)) {
         ParameterComponent component;
         component.id = IdAttribute(node);
-        for (const pugi::xml_node& track : node.children(kTrack)) {
+        for (const pugi::xml_node& track : node.children(kParamTrack)) {
             component.tracks.push_back(ReadTrack(track));
         }
         document.components.push_back(std::move(component));
@@ -244,7 +240,7 @@ NCFRESULT ReadParameterDocument(std::string_view xml, ParameterDocument& out,
             return NCF_E_NOTSUPPORTED;
         }
         // First for its words: the tree's own check has none.
-        NoEvents events;
+        XmlEvents events;
         EventReader check(events, "UTF-8");
         NCFRESULT result = check.Feed(xml.data(), xml.size(), true);
         if (result < 0) {

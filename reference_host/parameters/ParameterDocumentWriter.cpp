@@ -2,11 +2,11 @@
 // SPDX-License-Identifier: MIT
 #include <charconv>
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "reference_host/framework/Guard.h"
 #include "reference_host/framework/String.h"
 #include "reference_host/parameters/GuidText.h"
 #include "reference_host/parameters/ParameterDocument.h"
-#include "reference_host/parameters/ParameterNames.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/xml/XmlWriter.h"
 
@@ -14,7 +14,7 @@ namespace host {
 
 namespace {
 
-using namespace parameter_names;
+using namespace NMA;
 
 // The XML writer with plain texts; throws its refusals.
 class Printer {
@@ -46,11 +46,6 @@ public:
 
 private:
     static Ref<String> S(std::string_view text) { return MakeString(text); }
-    static void Check(NCFRESULT result) {
-        if (result < 0) {
-            throw result;
-        }
-    }
 
     Ref<XmlWriter> writer_;
 };
@@ -63,19 +58,20 @@ std::string FloatText(float number) {
 }
 
 const char* FlagText(bool flag) {
-    return flag ? kTrue : kFalse;
+    return flag ? kParamTrue : kParamFalse;
 }
 
 void WriteChoices(Printer& out, const ParameterInfo& info) {
-    out.Element(kValueInfo, kParameter);
-    out.Element(kDiscreteInfo, kValueInfo);
-    out.Attribute(kDiscreteInfo, kDefault, std::to_string(info.defaultValue.value_or(kNoDefault)));
+    out.Element(kParamValueInfo, kParamItem);
+    const char* const choices = kParamKindNames[kParamKindDiscrete].info;
+    out.Element(choices, kParamValueInfo);
+    out.Attribute(choices, kParamDefault, std::to_string(info.defaultValue.value_or(kNoDefault)));
     for (const ParameterChoice& choice : info.choices) {
         const std::string number = std::to_string(choice.value);
-        out.Element(kDiscrete, kDiscreteInfo);
-        out.Attribute(kDiscrete, kValue, number);
-        out.Attribute(kDiscrete, kName, choice.text);
-        out.Text(number, kDiscrete);
+        out.Element(kParamDiscrete, choices);
+        out.Attribute(kParamDiscrete, kParamValue, number);
+        out.Attribute(kParamDiscrete, kParamName, choice.text);
+        out.Text(number, kParamDiscrete);
     }
 }
 
@@ -83,21 +79,21 @@ void WriteRules(Printer& out, const ParameterInfo& info) {
     if (info.rules.empty()) {
         return;
     }
-    out.Element(kRuleSet, kParameter);
+    out.Element(kParamRuleSet, kParamItem);
     for (const ParameterRule& rule : info.rules) {
-        out.Element(kRule, kRuleSet);
-        out.Element(kCondition, kRule);
-        out.Attribute(kCondition, kId, GuidText(rule.parameter));
-        out.TextElement(kConditionValue, std::to_string(rule.value), kCondition);
-        out.TextElement(kOperation, rule.enables ? kEnable : kDisable, kRule);
+        out.Element(kParamRule, kParamRuleSet);
+        out.Element(kParamCondition, kParamRule);
+        out.Attribute(kParamCondition, kParamId, GuidText(rule.parameter));
+        out.TextElement(kParamConditionValue, std::to_string(rule.value), kParamCondition);
+        out.TextElement(kParamOperation, rule.enables ? kParamEnable : kParamDisable, kParamRule);
     }
 }
 
 void WriteInfo(Printer& out, const ParameterInfo& info, const char* parent) {
-    out.Element(kParameter, parent);
-    out.Attribute(kParameter, kId, GuidText(info.id));
-    out.TextElement(kShortName, info.name, kParameter);
-    out.TextElement(kDescription, info.label, kParameter);
+    out.Element(kParamItem, parent);
+    out.Attribute(kParamItem, kParamId, GuidText(info.id));
+    out.TextElement(kParamShortName, info.name, kParamItem);
+    out.TextElement(kParamDescription, info.label, kParamItem);
     WriteChoices(out, info);
     WriteRules(out, info);
 }
@@ -106,49 +102,50 @@ void WriteDescription(Printer& out, const ParameterTrack& track) {
     if (!track.descriptionVersion) {
         return;
     }
-    out.Element(kInfos, kTrack);
-    out.TextElement(kVersion, FloatText(*track.descriptionVersion), kInfos);
+    out.Element(kParamInfos, kParamTrack);
+    out.TextElement(kParamVersion, FloatText(*track.descriptionVersion), kParamInfos);
     for (const ParameterInfo& info : track.parameters) {
-        WriteInfo(out, info, kInfos);
+        WriteInfo(out, info, kParamInfos);
     }
     // The writer knows parents by name alone, so groups stay one deep.
     for (const ParameterGroup& group : track.groups) {
-        out.Element(kGroup, kInfos);
-        out.Attribute(kGroup, kId, GuidText(group.id));
-        out.Attribute(kGroup, kDisplayState, group.isShown ? kShow : kHide);
-        out.TextElement(kShortName, group.name, kGroup);
-        out.TextElement(kDescription, "", kGroup);
+        out.Element(kParamGroupItem, kParamInfos);
+        out.Attribute(kParamGroupItem, kParamId, GuidText(group.id));
+        out.Attribute(kParamGroupItem, kParamDisplayState, group.isShown ? kParamShow : kParamHide);
+        out.TextElement(kParamShortName, group.name, kParamGroupItem);
+        out.TextElement(kParamDescription, "", kParamGroupItem);
         for (const ParameterInfo& info : group.parameters) {
-            WriteInfo(out, info, kGroup);
+            WriteInfo(out, info, kParamGroupItem);
         }
     }
 }
 
 void WriteSet(Printer& out, const ParameterSet& set) {
-    out.Element(kSet, kTrack);
-    out.Attribute(kSet, kId, GuidText(set.id));
-    out.Attribute(kSet, kReadOnly, FlagText(set.isReadOnly));
+    out.Element(kParamSetItem, kParamTrack);
+    out.Attribute(kParamSetItem, kParamId, GuidText(set.id));
+    out.Attribute(kParamSetItem, kParamReadOnly, FlagText(set.isReadOnly));
     if (set.isDefault) {
-        out.Attribute(kSet, kDefault, kTrue);
+        out.Attribute(kParamSetItem, kParamDefault, kParamTrue);
     }
-    out.TextElement(kVersion, FloatText(set.version), kSet);
-    out.TextElement(kName, set.name, kSet);
+    out.TextElement(kParamVersion, FloatText(set.version), kParamSetItem);
+    out.TextElement(kParamName, set.name, kParamSetItem);
     for (const ParameterSetting& setting : set.settings) {
-        out.Element(kParameter, kSet);
-        out.Attribute(kParameter, kId, GuidText(setting.parameter));
-        out.Attribute(kParameter, kSilent, kFalse);
+        out.Element(kParamItem, kParamSetItem);
+        out.Attribute(kParamItem, kParamId, GuidText(setting.parameter));
+        out.Attribute(kParamItem, kParamSilent, kParamFalse);
         if (setting.value) {
-            out.TextElement(kValueUInt32, std::to_string(*setting.value), kParameter);
+            out.TextElement(kParamKindNames[kParamKindUInt32].value, std::to_string(*setting.value),
+                            kParamItem);
         }
     }
 }
 
 void WriteTrack(Printer& out, const ParameterTrack& track) {
-    out.Element(kTrack, kComponent);
-    out.Attribute(kTrack, kNumber, std::to_string(track.number));
+    out.Element(kParamTrack, kParamComponent);
+    out.Attribute(kParamTrack, kParamNumber, std::to_string(track.number));
     WriteDescription(out, track);
     if (track.activeSet) {
-        out.TextElement(kActiveSet, GuidText(*track.activeSet), kTrack);
+        out.TextElement(kParamActiveSet, GuidText(*track.activeSet), kParamTrack);
     }
     for (const ParameterSet& set : track.sets) {
         WriteSet(out, set);
@@ -160,10 +157,10 @@ void WriteTrack(Printer& out, const ParameterTrack& track) {
 NCFRESULT WriteParameterDocument(const ParameterDocument& document, std::string& xml) {
     return Guarded([&] {
         Printer out;
-        out.Root(kRoot);
+        out.Root(kParamRoot);
         for (const ParameterComponent& component : document.components) {
-            out.Element(kComponent, kRoot);
-            out.Attribute(kComponent, kId, GuidText(component.id));
+            out.Element(kParamComponent, kParamRoot);
+            out.Attribute(kParamComponent, kParamId, GuidText(component.id));
             for (const ParameterTrack& track : component.tracks) {
                 WriteTrack(out, track);
             }

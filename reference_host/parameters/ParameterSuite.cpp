@@ -37,9 +37,7 @@ NCFRESULT ParameterSuite::SetComponentId(const GUID& component) {
 
 NCFRESULT ParameterSuite::Prepare(ncfUInt32 track) {
     return Guarded([&] {
-        if (!isNamed_) {
-            return NCF_E_FAIL;
-        }
+        Need(isNamed_, NCF_E_FAIL);
         component_.tracks.assign(1, {});
         component_.tracks[0].number = track;
         dependencies_.clear();
@@ -50,12 +48,8 @@ NCFRESULT ParameterSuite::Prepare(ncfUInt32 track) {
 
 NCFRESULT ParameterSuite::WriteXML(INCFString* out) {
     return Guarded([&] {
-        if (out == nullptr) {
-            return NCF_E_POINTER;
-        }
-        if (stage_ == Stage::kEmpty || stage_ == Stage::kDescribing) {
-            return NCF_E_FAIL;
-        }
+        Need(out);
+        Need(stage_ != Stage::kEmpty && stage_ != Stage::kDescribing, NCF_E_FAIL);
         std::string xml;
         const NCFRESULT written = WriteParameterDocument({{component_}}, xml);
         return written < 0 ? written : text::Assign(out, text::FromUtf8(xml), kNCFUTF8);
@@ -80,16 +74,10 @@ NCFRESULT ParameterSuite::AddGroup(const GUID& group, const char* name, ncfUInt3
                                    ncfUInt32 isShown) {
     return Guarded([&] {
         ParameterGroup added;
-        if (stage_ != Stage::kDescribing) {
-            return NCF_E_FAIL;
-        }
-        if (!Take(name, added.name)) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(stage_ == Stage::kDescribing, NCF_E_FAIL);
+        Need(Take(name, added.name), NCF_E_INVALIDARG);
         ParameterTrack& track = component_.tracks[0];
-        if (Holds(track.groups, group)) {
-            return NMA_E_ALREADYSET;
-        }
+        Need(!Holds(track.groups, group), NMA_E_ALREADYSET);
         added.id = group;
         added.isShown = isShown != 0;
         track.groups.push_back(std::move(added));
@@ -101,18 +89,10 @@ NCFRESULT ParameterSuite::AddParameter(const GUID& parameter, const char* intern
                                        const char* label, ncfUInt32, const GUID& type) {
     return Guarded([&] {
         ParameterInfo added;
-        if (stage_ != Stage::kDescribing) {
-            return NCF_E_FAIL;
-        }
-        if (type != kParamTypeChoice) {
-            return NCF_E_NOTSUPPORTED;
-        }
-        if (!Take(internalName, added.name) || !Take(label, added.label)) {
-            return NCF_E_INVALIDARG;
-        }
-        if (FindParameter(parameter) != nullptr) {
-            return NMA_E_ALREADYSET;
-        }
+        Need(stage_ == Stage::kDescribing, NCF_E_FAIL);
+        Need(type == kParamTypeChoice, NCF_E_NOTSUPPORTED);
+        Need(Take(internalName, added.name) && Take(label, added.label), NCF_E_INVALIDARG);
+        Need(FindParameter(parameter) == nullptr, NMA_E_ALREADYSET);
         added.id = parameter;
         ParameterTrack& track = component_.tracks[0];
         auto& list = track.groups.empty() ? track.parameters : track.groups.back().parameters;
@@ -123,9 +103,7 @@ NCFRESULT ParameterSuite::AddParameter(const GUID& parameter, const char* intern
 
 NCFRESULT ParameterSuite::EndDescription() {
     return Guarded([&] {
-        if (stage_ != Stage::kDescribing) {
-            return NCF_E_FAIL;
-        }
+        Need(stage_ == Stage::kDescribing, NCF_E_FAIL);
         for (const Dependency& dependency : dependencies_) {
             if (FindParameter(dependency.parameter) == nullptr) {
                 return NCF_E_NOTFOUND;
@@ -144,12 +122,8 @@ NCFRESULT ParameterSuite::AddValueChoice(const char* text, ncfUInt32 value, ncfB
     return Guarded([&] {
         ParameterInfo* const info = LastParameter();
         ParameterChoice added;
-        if (info == nullptr) {
-            return NCF_E_FAIL;
-        }
-        if (!Take(text, added.text)) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(info, NCF_E_FAIL);
+        Need(Take(text, added.text), NCF_E_INVALIDARG);
         const bool isThere =
             std::any_of(info->choices.begin(), info->choices.end(),
                         [&](const ParameterChoice& choice) { return choice.value == value; });
@@ -169,12 +143,8 @@ NCFRESULT ParameterSuite::AddDependency(ncfUInt32 kind, const GUID& parameter,
                                         IParameterValue* value, ncfUInt32) {
     return Guarded([&] {
         const ParameterInfo* const info = LastParameter();
-        if (info == nullptr) {
-            return NCF_E_FAIL;
-        }
-        if (value == nullptr) {
-            return NCF_E_POINTER;
-        }
+        Need(info, NCF_E_FAIL);
+        Need(value);
         if (kind != kEnables && kind != kDisables) {
             return NCF_E_INVALIDARG;
         }
@@ -219,16 +189,10 @@ NCFRESULT ParameterSuite::AddParamSet(const GUID& set, const char* name, ncfUInt
                                       ncfBool isDefault) {
     return Guarded([&] {
         ParameterSet added;
-        if (stage_ == Stage::kEmpty || stage_ == Stage::kDescribing) {
-            return NCF_E_FAIL;
-        }
-        if (!Take(name, added.name) || !std::isfinite(version)) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(stage_ != Stage::kEmpty && stage_ != Stage::kDescribing, NCF_E_FAIL);
+        Need(Take(name, added.name) && std::isfinite(version), NCF_E_INVALIDARG);
         ParameterTrack& track = component_.tracks[0];
-        if (Holds(track.sets, set)) {
-            return NMA_E_ALREADYSET;
-        }
+        Need(!Holds(track.sets, set), NMA_E_ALREADYSET);
         added.id = set;
         added.version = version;
         added.isDefault = isDefault != 0;
@@ -240,19 +204,13 @@ NCFRESULT ParameterSuite::AddParamSet(const GUID& set, const char* name, ncfUInt
 
 NCFRESULT ParameterSuite::AddParamValue(const GUID& parameter, IParameterValue* value) {
     return Guarded([&] {
-        if (stage_ == Stage::kEmpty || component_.tracks[0].sets.empty()) {
-            return NCF_E_FAIL;
-        }
-        if (value == nullptr) {
-            return NCF_E_POINTER;
-        }
+        Need(stage_ != Stage::kEmpty && !component_.tracks[0].sets.empty(), NCF_E_FAIL);
+        Need(value);
         auto& settings = component_.tracks[0].sets.back().settings;
         const bool isThere = std::any_of(
             settings.begin(), settings.end(),
             [&](const ParameterSetting& setting) { return setting.parameter == parameter; });
-        if (isThere) {
-            return NMA_E_ALREADYSET;
-        }
+        Need(!isThere, NMA_E_ALREADYSET);
         ncfUInt32 number = 0;
         const NCFRESULT read = value->GetData(&number, sizeof number);
         if (read >= 0) {

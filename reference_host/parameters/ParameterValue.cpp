@@ -42,11 +42,9 @@ NCFRESULT ParameterValue::GetData(void* data, ncfUInt32 bytes) {
 }
 
 NCFRESULT ValueFactory::CreateValue(IParameterValue** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
     return Guarded([&] {
+        Need(out);
+        *out = nullptr;
         *out = MakeRef<ParameterValue>().Detach();
         return NCF_OK;
     });

@@ -7,7 +7,7 @@
 #include "host_interfaces/parameters/ParameterIds.h"
 #include "host_interfaces/parameters/ParameterValue.h"
 #include "reference_host/framework/Component.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 namespace host {
 

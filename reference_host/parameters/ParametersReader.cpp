@@ -14,13 +14,6 @@ namespace {
 
 enum SetState : ncfUInt32 { kNotInUse = 0, kInUse = 1, kInUseReadOnly = 2 };
 
-// The events end with the first failure of the handler.
-void Check(NCFRESULT result) {
-    if (result < 0) {
-        throw result;
-    }
-}
-
 void TellSet(NMA::IParametersHandler& handler, const ParameterTrack& track,
              const ParameterSet& set) {
     const SetState state = !track.IsInUse(set) ? kNotInUse
@@ -34,7 +27,8 @@ void TellSet(NMA::IParametersHandler& handler, const ParameterTrack& track,
     }
 }
 
-// The handler hears nothing of tracks: sets of all of them come in turn.
+// The handler hears nothing of tracks: sets of all of them come in turn. Its first
+// failure ends the events.
 void Tell(NMA::IParametersHandler& handler, const ParameterDocument& document) {
     Check(handler.BeginDocument());
     for (const ParameterComponent& component : document.components) {
@@ -58,12 +52,8 @@ NCFRESULT ParametersReader::SetHandler(NMA::IParametersHandler* handler) {
 
 NCFRESULT ParametersReader::Parse(INCFString* xml) {
     return Guarded([&] {
-        if (xml == nullptr) {
-            return NCF_E_POINTER;
-        }
-        if (!handler_) {
-            return NMA_E_NOTINITIALIZED;
-        }
+        Need(xml);
+        Need(handler_, NMA_E_NOTINITIALIZED);
         ParameterDocument document;
         std::string problem = "a character that has no place in it";
         std::string bytes;

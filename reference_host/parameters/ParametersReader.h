@@ -5,8 +5,8 @@
 #include "host_interfaces/framework/Console.h"
 #include "host_interfaces/parameters/ParametersReader.h"
 #include "reference_host/framework/Component.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/parameters/ParameterDocument.h"
+#include "reference_host/util/Ref.h"
 
 namespace host {
 

@@ -20,21 +20,15 @@ constexpr std::size_t kPieceWords = 262144;
 NCFRESULT AudioReader::SetParams(ncfUInt32 track, ncfUInt32 bytesPerSample, ncfUInt8 littleEndian,
                                  double, ncfUInt32& channels) {
     const std::lock_guard<std::mutex> lock(mutex_);
-    const auto stream = streams_.find(track);
-    if (stream == streams_.end()) {
-        return NCF_E_NOTFOUND;
-    }
-    if (bytesPerSample < 1 || bytesPerSample > 4) {
-        return NCF_E_INVALIDARG;
-    }
     return Guarded([&] {
+        const auto stream = streams_.find(track);
+        Need(stream != streams_.end(), NCF_E_NOTFOUND);
+        Need(bytesPerSample >= 1 && bytesPerSample <= 4, NCF_E_INVALIDARG);
         Track& entry = tracks_[track];
         if (!entry.decoder) {
             entry.decoder = EditedSound::Open(path_, stream->second, hasWholeIndex_);
         }
-        if (!entry.decoder) {
-            return NCF_E_FAIL;
-        }
+        Need(entry.decoder, NCF_E_FAIL);
         entry.bytesPerSample = static_cast<int>(bytesPerSample);
         entry.littleEndian = littleEndian != 0;
         channels = static_cast<ncfUInt32>(entry.decoder->Channels());
@@ -45,14 +39,10 @@ NCFRESULT AudioReader::SetParams(ncfUInt32 track, ncfUInt32 bytesPerSample, ncfU
 NCFRESULT AudioReader::ReadSamples(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* count,
                                    void* destination, ncfUInt64 size, ncfUInt8, ncfUInt8) {
     const std::lock_guard<std::mutex> lock(mutex_);
-    if (!count || !destination) {
-        return NCF_E_POINTER;
-    }
-    const auto found = tracks_.find(track);
-    if (found == tracks_.end() || found->second.bytesPerSample == 0) {
-        return NMA_E_NOTINITIALIZED;
-    }
     return Guarded([&] {
+        Need(count && destination);
+        const auto found = tracks_.find(track);
+        Need(found != tracks_.end() && found->second.bytesPerSample != 0, NMA_E_NOTINITIALIZED);
         Track& entry = found->second;
         const auto wide = static_cast<std::size_t>(entry.decoder->Channels());
         const std::size_t frameBytes = wide * static_cast<std::size_t>(entry.bytesPerSample);

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <memory>
+#include <type_traits>
 
 extern "C" {
 #include <libavcodec/avcodec.h>
@@ -20,34 +21,22 @@ struct CloseInput {
 };
 using InputOwner = std::unique_ptr<AVFormatContext, CloseInput>;
 
-struct FreeCodec {
-    void operator()(AVCodecContext* context) const { avcodec_free_context(&context); }
+template <auto Free>
+struct FreeBy {
+    template <class Handle>
+    void operator()(Handle* handle) const {
+        if constexpr (std::is_invocable_v<decltype(Free), Handle**>) {
+            Free(&handle);
+        } else {
+            Free(handle);
+        }
+    }
 };
-using CodecOwner = std::unique_ptr<AVCodecContext, FreeCodec>;
-
-struct FreeFrame {
-    void operator()(AVFrame* frame) const { av_frame_free(&frame); }
-};
-using FrameOwner = std::unique_ptr<AVFrame, FreeFrame>;
-
-struct FreePacket {
-    void operator()(AVPacket* packet) const { av_packet_free(&packet); }
-};
-using PacketOwner = std::unique_ptr<AVPacket, FreePacket>;
-
-struct FreeParser {
-    void operator()(AVCodecParserContext* parser) const { av_parser_close(parser); }
-};
-using ParserOwner = std::unique_ptr<AVCodecParserContext, FreeParser>;
-
-struct FreeResampler {
-    void operator()(SwrContext* resampler) const { swr_free(&resampler); }
-};
-using ResamplerOwner = std::unique_ptr<SwrContext, FreeResampler>;
-
-struct FreeScaler {
-    void operator()(SwsContext* scaler) const { sws_freeContext(scaler); }
-};
-using ScalerOwner = std::unique_ptr<SwsContext, FreeScaler>;
+using CodecOwner = std::unique_ptr<AVCodecContext, FreeBy<avcodec_free_context>>;
+using FrameOwner = std::unique_ptr<AVFrame, FreeBy<av_frame_free>>;
+using PacketOwner = std::unique_ptr<AVPacket, FreeBy<av_packet_free>>;
+using ParserOwner = std::unique_ptr<AVCodecParserContext, FreeBy<av_parser_close>>;
+using ResamplerOwner = std::unique_ptr<SwrContext, FreeBy<swr_free>>;
+using ScalerOwner = std::unique_ptr<SwsContext, FreeBy<sws_freeContext>>;
 
 }  // namespace host

@@ -4,11 +4,21 @@
 #include "reference_host/quicktime/MovieAtoms.h"
 
 #include <algorithm>
-#include <fstream>
+#include <array>
 #include <limits>
 
 namespace host {
 namespace {
+
+using header_parser::Code;
+using header_parser::FileBytes;
+using header_parser::LoadU16;
+using header_parser::LoadU32;
+using header_parser::LoadU64;
+using header_parser::StoredAtom;
+using header_parser::StoredAtoms;
+using header_parser::StoredEntries;
+using header_parser::StoredTable;
 
 constexpr int kDeepest = 8;
 constexpr std::size_t kMostTracks = 65536;
@@ -16,73 +26,30 @@ constexpr ncfUInt32 kMostReferences = 4096;
 constexpr std::size_t kMostDescriptionChanges = 65536;
 constexpr ncfUInt64 kMostEdits = 4096;
 
-constexpr ncfUInt32 Code(const char (&text)[5]) {
-    return static_cast<ncfUInt32>(static_cast<unsigned char>(text[0])) << 24 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[1])) << 16 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[2])) << 8 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[3]));
-}
-
 // Walks the atoms that lead to the few numbers wanted and steps over all
 // others, so the cost does not grow with the media.
 class Walker {
 public:
-    Walker(const std::filesystem::path& path, MovieAtoms& out)
-        : stream_(path, std::ios::binary), out_(out) {
-        stream_.seekg(0, std::ios::end);
-        const std::streamoff end = stream_.tellg();
-        length_ = end > 0 ? static_cast<ncfUInt64>(end) : 0;
-    }
+    Walker(const std::filesystem::path& path, MovieAtoms& out) : source_(path), out_(out) {}
 
-    void Run() { Walk(0, length_, 0); }
+    void Run() { Walk(StoredAtoms(source_), 0); }
 
 private:
-    bool Read(ncfUInt64 position, ncfUInt8* to, std::size_t size) {
-        if (size > length_ || position > length_ - size) {
-            return false;
-        }
-        stream_.clear();
-        stream_.seekg(static_cast<std::streamoff>(position));
-        return static_cast<bool>(
-            stream_.read(reinterpret_cast<char*>(to), static_cast<std::streamsize>(size)));
-    }
-    static ncfUInt64 Number(const ncfUInt8* bytes, int count) {
-        ncfUInt64 value = 0;
-        for (int i = 0; i < count; ++i) {
-            value = value << 8 | bytes[i];
-        }
-        return value;
-    }
-
-    void Walk(ncfUInt64 position, ncfUInt64 end, int depth) {
-        ncfUInt8 head[16];
-        while (end - position >= 8 && Read(position, head, 8)) {
-            ncfUInt64 size = Number(head, 4);
-            const ncfUInt32 code = static_cast<ncfUInt32>(Number(head + 4, 4));
-            ncfUInt64 body = 8;
-            if (size == 1 && Read(position, head, 16)) {
-                size = Number(head + 8, 8);
-                body = 16;
-            } else if (size == 0) {
-                size = end - position;
-            }
-            if (size < body || size > end - position) {
-                return;
-            }
-            Visit(code, position + body, position + size, depth);
-            position += size;
+    void Walk(StoredAtoms atoms, int depth) {
+        for (StoredAtom atom; atoms.Next(atom) && !atom.isCutShort;) {
+            Visit(atom, depth);
         }
     }
 
-    void Visit(ncfUInt32 code, ncfUInt64 position, ncfUInt64 end, int depth) {
-        switch (code) {
+    void Visit(const StoredAtom& atom, int depth) {
+        switch (atom.type) {
             case Code("moof"):
                 out_.isFragmented = out_.isFragmented || depth == 0;
                 return;
             case Code("trak"):
                 if (out_.tracks.size() < kMostTracks) {
                     out_.tracks.emplace_back();
-                    Descend(position, end, depth);
+                    Descend(atom.begin, atom.end, depth);
                 }
                 return;
             case Code("moov"):
@@ -91,212 +58,193 @@ private:
             case Code("dinf"):
             case Code("stbl"):
             case Code("edts"):
-                Descend(position, end, depth);
+                Descend(atom.begin, atom.end, depth);
                 return;
             case Code("mvhd"):
-                ReadMovieHeader(position, end);
+                ReadTimes(atom, 0, out_.timeScale, out_.duration);
                 return;
+            default:
+                if (!out_.tracks.empty()) {
+                    VisitInTrack(atom, out_.tracks.back(), depth);
+                }
+        }
+    }
+
+    void VisitInTrack(const StoredAtom& atom, MovieAtoms::Track& track, int depth) {
+        switch (atom.type) {
             case Code("tkhd"):
-                ReadTrackHeader(position, end);
+                ReadTimes(atom, 4, track.id, track.duration);
                 return;
             case Code("mdhd"):
-                ReadMediaHeader(position, end);
+                ReadTimes(atom, 0, track.mediaTimeScale, track.mediaDuration);
                 return;
             case Code("stsd"):
-                ReadDescriptions(position, end, depth);
+                ReadDescriptions(atom, track, depth);
                 return;
             case Code("pcmC"):
-                ReadLinearKind(position, end);
+                ReadLinearKind(atom, track);
                 return;
             case Code("elst"):
-                ReadEdits(position, end);
+                ReadEdits(atom, track);
                 return;
             case Code("stts"):
-                FindDurations(position, end);
+                if (!track.durations && atom.Size() >= 8) {
+                    track.durations = StoredTable(source_, atom.begin, atom.end, 8);
+                }
                 return;
             case Code("stsc"):
-                ReadChunks(position, end);
+                ReadChunks(atom, track);
                 return;
             case Code("dref"):
-                ReadReferences(position, end);
+                ReadReferences(atom, track);
                 return;
             default:
                 return;
         }
     }
 
-    void Descend(ncfUInt64 position, ncfUInt64 end, int depth) {
+    void Descend(ncfUInt64 begin, ncfUInt64 end, int depth) {
         if (depth < kDeepest) {
-            Walk(position, end, depth + 1);
+            Walk(StoredAtoms(source_, begin, end), depth + 1);
         }
     }
 
-    void ReadMovieHeader(ncfUInt64 position, ncfUInt64 end) {
-        ncfUInt8 bytes[32];
-        if (end - position < 32 || !Read(position, bytes, sizeof bytes)) {
-            return;
-        }
-        const bool isLong = bytes[0] == 1;
-        out_.timeScale = static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
-        out_.duration = isLong ? Number(bytes + 24, 8) : Number(bytes + 16, 4);
+    // The first bytes of an atom; false when it has fewer.
+    template <std::size_t Size>
+    bool Read(const StoredAtom& atom, ncfUInt8 (&bytes)[Size]) {
+        return atom.Size() >= Size && source_.Read(atom.begin, bytes, Size);
     }
 
-    void ReadTrackHeader(ncfUInt64 position, ncfUInt64 end) {
-        ncfUInt8 bytes[36];
-        if (out_.tracks.empty() || end - position < 36 || !Read(position, bytes, sizeof bytes)) {
-            return;
+    // The number and, `between` bytes further on, the duration in a header: behind
+    // version, flags and two dates, which version 1 has in 64 bits like the duration.
+    void ReadTimes(const StoredAtom& atom, ncfUInt64 between, ncfUInt32& number,
+                   ncfUInt64& duration) {
+        const bool isLong = IsLong(atom);
+        const ncfUInt64 numberAt = isLong ? 20 : 12;
+        const ncfUInt64 durationAt = numberAt + 4 + between;
+        ncfUInt8 bytes[8] = {};
+        if (atom.Size() >= durationAt + (isLong ? 8 : 4) &&
+            source_.Read(atom.begin + durationAt, isLong ? bytes : bytes + 4, isLong ? 8 : 4)) {
+            number = source_.U32(atom.begin + numberAt);
+            duration = LoadU64(bytes);
         }
-        const bool isLong = bytes[0] == 1;
-        out_.tracks.back().id = static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
-        out_.tracks.back().duration = isLong ? Number(bytes + 28, 8) : Number(bytes + 20, 4);
     }
 
-    void ReadMediaHeader(ncfUInt64 position, ncfUInt64 end) {
-        ncfUInt8 bytes[32];
-        const std::size_t least = 20;
-        if (out_.tracks.empty() || end - position < least || !Read(position, bytes, least)) {
+    bool IsLong(const StoredAtom& atom) { return source_.U32(atom.begin) >> 24 == 1; }
+
+    void ReadEdits(const StoredAtom& atom, MovieAtoms::Track& track) {
+        if (atom.Size() < 8) {
             return;
         }
-        const bool isLong = bytes[0] == 1;
-        if (isLong && (end - position < sizeof bytes || !Read(position, bytes, sizeof bytes))) {
-            return;
+        if (IsLong(atom)) {
+            ReadEdits<5>(atom, track, [](const std::array<ncfUInt32, 5>& entry) {
+                return MovieAtoms::Edit{
+                    ncfUInt64{entry[0]} << 32 | entry[1],
+                    static_cast<ncfSInt64>(ncfUInt64{entry[2]} << 32 | entry[3])};
+            });
+        } else {
+            ReadEdits<3>(atom, track, [](const std::array<ncfUInt32, 3>& entry) {
+                return MovieAtoms::Edit{entry[0], ncfSInt64{static_cast<ncfSInt32>(entry[1])}};
+            });
         }
-        out_.tracks.back().mediaTimeScale =
-            static_cast<ncfUInt32>(Number(bytes + (isLong ? 20 : 12), 4));
-        out_.tracks.back().mediaDuration = isLong ? Number(bytes + 24, 8) : Number(bytes + 16, 4);
     }
 
-    void ReadEdits(ncfUInt64 position, ncfUInt64 end) {
-        constexpr ncfUInt64 kPlain = 0x10000;
-        ncfUInt8 bytes[20];
-        if (out_.tracks.empty() || end - position < 8 || !Read(position, bytes, 8)) {
-            return;
-        }
-        const bool isLong = bytes[0] == 1;
-        const ncfUInt64 size = isLong ? 20 : 12;
-        const ncfUInt64 count = std::min(Number(bytes + 4, 4), (end - position - 8) / size);
+    template <std::size_t Numbers, class ToEdit>
+    void ReadEdits(const StoredAtom& atom, MovieAtoms::Track& track, ToEdit toEdit) {
+        constexpr ncfUInt32 kPlainRate = 0x10000;
+        const StoredTable table(source_, atom.begin, atom.end, Numbers * 4);
+        StoredEntries<Numbers> entries(source_, table);
         std::vector<MovieAtoms::Edit> edits;
-        for (ncfUInt64 i = 0; i < count; ++i) {
-            if (count > kMostEdits ||
-                !Read(position + 8 + size * i, bytes, static_cast<std::size_t>(size)) ||
-                Number(bytes + size - 4, 4) != kPlain) {
+        for (std::array<ncfUInt32, Numbers> entry; entries.Next(entry);) {
+            if (table.count > kMostEdits || entry.back() != kPlainRate) {
                 return;
             }
-            const ncfUInt64 time = isLong ? Number(bytes + 8, 8) : Number(bytes + 4, 4);
-            edits.push_back(
-                {isLong ? Number(bytes, 8) : Number(bytes, 4),
-                 isLong ? static_cast<ncfSInt64>(time)
-                        : ncfSInt64{static_cast<ncfSInt32>(static_cast<ncfUInt32>(time))}});
+            edits.push_back(toEdit(entry));
         }
-        out_.tracks.back().edits = std::move(edits);
+        if (!entries.Failed()) {
+            track.edits = std::move(edits);
+        }
     }
 
-    void ReadDescriptions(ncfUInt64 position, ncfUInt64 end, int depth) {
+    void ReadDescriptions(const StoredAtom& atom, MovieAtoms::Track& track, int depth) {
         ncfUInt8 bytes[8];
-        if (!out_.tracks.empty() && end - position >= 8 && Read(position, bytes, sizeof bytes)) {
+        if (Read(atom, bytes)) {
             // No description is shorter than its own head.
-            const ncfUInt64 most = (end - position - 8) / 16;
-            const ncfUInt64 count = Number(bytes + 4, 4);
-            out_.tracks.back().descriptionCount =
-                static_cast<ncfUInt32>(count < most ? count : most);
-            ReadFirstDescription(position + 8, end, bytes[0] != 0, depth);
+            track.descriptionCount =
+                static_cast<ncfUInt32>(StoredTable(source_, atom.begin, atom.end, 16).count);
+            ReadFirstDescription({0, atom.begin + 8, atom.end}, track, bytes[0] != 0, depth);
         }
     }
 
     // The size of pictures, and of the one kind of sound whose form stands in an
     // atom behind the fields, that. In a list of the ISO form version 1 adds none.
-    void ReadFirstDescription(ncfUInt64 position, ncfUInt64 end, bool isIso, int depth) {
+    void ReadFirstDescription(const StoredAtom& list, MovieAtoms::Track& track, bool isIso,
+                              int depth) {
         constexpr ncfUInt64 kFields = 36;
         constexpr ncfUInt64 kFieldsOfVersion1 = kFields + 16;
         constexpr ncfUInt64 kFieldsOfVersion2 = kFields + 36;
         ncfUInt8 bytes[kFields + 4];
-        if (end - position < sizeof bytes || !Read(position, bytes, sizeof bytes)) {
+        if (!Read(list, bytes)) {
             return;
         }
-        out_.tracks.back().width = static_cast<ncfUInt32>(Number(bytes + 32, 2));
-        out_.tracks.back().height = static_cast<ncfUInt32>(Number(bytes + 34, 2));
-        const ncfUInt64 size = Number(bytes, 4);
-        const ncfUInt64 code = Number(bytes + 4, 4);
-        const ncfUInt64 version = Number(bytes + 16, 2);
-        const ncfUInt64 fields = version == 2
-                                     ? std::max(kFieldsOfVersion2, Number(bytes + kFields, 4))
-                                 : version == 1 && !isIso ? kFieldsOfVersion1
-                                                          : kFields;
+        track.width = LoadU16(bytes + 32);
+        track.height = LoadU16(bytes + 34);
+        const ncfUInt64 size = LoadU32(bytes);
+        const ncfUInt32 code = LoadU32(bytes + 4);
+        const ncfUInt16 version = LoadU16(bytes + 16);
+        const ncfUInt64 fields =
+            version == 2 ? std::max<ncfUInt64>(kFieldsOfVersion2, LoadU32(bytes + kFields))
+            : version == 1 && !isIso ? kFieldsOfVersion1
+                                     : kFields;
         const bool isLinear = code == Code("ipcm") || code == Code("fpcm");
-        if (isLinear && size >= fields && size <= end - position) {
-            Descend(position + fields, position + size, depth);
+        if (isLinear && size >= fields && size <= list.Size()) {
+            Descend(list.begin + fields, list.begin + size, depth);
         }
     }
 
-    // The table may be long, and few ask for it.
-    void FindDurations(ncfUInt64 position, ncfUInt64 end) {
-        ncfUInt8 bytes[8];
-        if (!out_.tracks.empty() && !out_.tracks.back().durationsAt && end - position >= 8 &&
-            Read(position, bytes, sizeof bytes)) {
-            out_.tracks.back().durationsAt = position + 8;
-            out_.tracks.back().durationEntries =
-                static_cast<ncfUInt32>(std::min(Number(bytes + 4, 4), (end - position - 8) / 8));
-        }
-    }
-
-    void ReadLinearKind(ncfUInt64 position, ncfUInt64 end) {
+    void ReadLinearKind(const StoredAtom& atom, MovieAtoms::Track& track) {
         ncfUInt8 bytes[6];
-        if (!out_.tracks.empty() && end - position >= 6 && Read(position, bytes, sizeof bytes)) {
-            out_.tracks.back().isLittleEndian = (bytes[4] & 1) != 0;
-            out_.tracks.back().linearBits = bytes[5];
+        if (Read(atom, bytes)) {
+            track.isLittleEndian = (bytes[4] & 1) != 0;
+            track.linearBits = bytes[5];
         }
     }
 
     // Each entry: first chunk, samples of a chunk, description. Tracks of one
     // description are left alone, for the table may be long.
-    void ReadChunks(ncfUInt64 position, ncfUInt64 end) {
-        ncfUInt8 bytes[12];
-        if (out_.tracks.empty() || out_.tracks.back().descriptionCount < 2 || end - position < 8 ||
-            !Read(position, bytes, 8)) {
+    void ReadChunks(const StoredAtom& atom, MovieAtoms::Track& track) {
+        if (track.descriptionCount < 2) {
             return;
         }
-        const ncfUInt64 most = (end - position - 8) / 12;
-        const ncfUInt64 count = std::min(Number(bytes + 4, 4), most);
-        std::vector<ncfUInt64>& changes = out_.tracks.back().descriptionChanges;
-        ncfUInt64 samples = 0, chunk = 1, perChunk = 0, description = 0;
-        for (ncfUInt64 i = 0; i < count && changes.size() < kMostDescriptionChanges &&
-                              Read(position + 8 + 12 * i, bytes, sizeof bytes);
-             ++i) {
-            const ncfUInt64 first = Number(bytes, 4);
-            if (first < chunk) {
-                return;
+        StoredEntries<3> entries(source_, StoredTable(source_, atom.begin, atom.end, 12));
+        std::array<ncfUInt32, 3> run, former{1, 0, 0};
+        ncfUInt64 samples = 0;
+        for (bool isFirst = true; track.descriptionChanges.size() < kMostDescriptionChanges &&
+                                  entries.Next(run) && run[0] >= former[0];
+             isFirst = false) {
+            samples += ncfUInt64{run[0] - former[0]} * former[1];
+            if (!isFirst && run[2] != former[2]) {
+                track.descriptionChanges.push_back(samples);
             }
-            samples += (first - chunk) * perChunk;
-            const ncfUInt64 now = Number(bytes + 8, 4);
-            if (i > 0 && now != description) {
-                changes.push_back(samples);
-            }
-            chunk = first;
-            perChunk = Number(bytes + 4, 4);
-            description = now;
+            former = run;
         }
     }
 
     // A reference whose lowest flag is set means this very file.
-    void ReadReferences(ncfUInt64 position, ncfUInt64 end) {
+    void ReadReferences(const StoredAtom& atom, MovieAtoms::Track& track) {
         ncfUInt8 bytes[12];
-        position += 8;
-        for (ncfUInt32 i = 0; i < kMostReferences && position < end && end - position >= 12 &&
-                              !out_.tracks.empty() && Read(position, bytes, sizeof bytes);
+        StoredAtom rest{0, atom.begin + 8, atom.end};
+        for (ncfUInt32 i = 0; i < kMostReferences && rest.begin < rest.end && Read(rest, bytes);
              ++i) {
-            if ((bytes[11] & 1) == 0) {
-                out_.tracks.back().needsOtherFiles = true;
-            }
-            const ncfUInt64 size = Number(bytes, 4);
-            if (size < 12) {
+            track.needsOtherFiles = track.needsOtherFiles || (bytes[11] & 1) == 0;
+            if (LoadU32(bytes) < sizeof bytes) {
                 return;
             }
-            position += size;
+            rest.begin += LoadU32(bytes);
         }
     }
 
-    std::ifstream stream_;
-    ncfUInt64 length_ = 0;
+    FileBytes source_;
     MovieAtoms& out_;
 };
 
@@ -314,29 +262,21 @@ const MovieAtoms::Track* MovieAtoms::Find(ncfUInt32 id) const {
 std::optional<SampleDurations> SumDurations(const std::filesystem::path& path,
                                             const MovieAtoms::Track& track) {
     constexpr ncfUInt64 kMost = std::numeric_limits<ncfUInt64>::max() / 2;
-    std::ifstream stream(path, std::ios::binary);
-    if (!track.durationsAt ||
-        !stream.seekg(static_cast<std::streamoff>(track.durationsAt.value()))) {
+    if (!track.durations) {
         return std::nullopt;
     }
-    const auto number = [](const ncfUInt8* bytes) {
-        return ncfUInt64{bytes[0]} << 24 | ncfUInt64{bytes[1]} << 16 | ncfUInt64{bytes[2]} << 8 |
-               bytes[3];
-    };
+    FileBytes source(path);
+    StoredEntries<2> runs(source, *track.durations);
     SampleDurations sum;
-    ncfUInt8 entry[8];
-    for (ncfUInt32 i = 0; i < track.durationEntries; ++i) {
-        if (!stream.read(reinterpret_cast<char*>(entry), sizeof entry)) {
-            return std::nullopt;
-        }
-        const ncfUInt64 units = number(entry) * number(entry + 4);
+    for (std::array<ncfUInt32, 2> run; runs.Next(run);) {
+        const ncfUInt64 units = ncfUInt64{run[0]} * run[1];
         if (units > kMost - sum.units) {
             return std::nullopt;
         }
-        sum.samples += number(entry);
+        sum.samples += run[0];
         sum.units += units;
     }
-    return sum;
+    return runs.Failed() ? std::nullopt : std::optional(sum);
 }
 
 MovieAtoms ReadMovieAtoms(const std::filesystem::path& path) {

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "host_interfaces/framework/Types.h"
+#include "reference_host/header_parser/StoredAtom.h"
 
 namespace host {
 
@@ -31,9 +32,7 @@ struct MovieAtoms {
         bool isLittleEndian = false;
         ncfUInt32 mediaTimeScale = 0;
         ncfUInt64 mediaDuration = 0;  // media time units, as its header tells
-        // Where the table of sample durations is, behind its count. None: no table.
-        std::optional<ncfUInt64> durationsAt;
-        ncfUInt32 durationEntries = 0;
+        std::optional<header_parser::StoredTable> durations;  // of runs of samples
         // Of pictures, as the first description has it.
         ncfUInt32 width = 0;
         ncfUInt32 height = 0;

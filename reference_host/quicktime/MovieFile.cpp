@@ -312,9 +312,8 @@ std::optional<double> MovieFile::RateOfTable(int stream) const {
 // The same of a movie whose atoms can't be read where they lie. 0.0 where the
 // library does not tell both.
 double MovieFile::MeanRateOfMedia(int stream) const {
-    std::string ignored;
-    const InputOwner whole = OpenInput(path_, InputView::WholeMedia, ignored);
-    if (!whole || stream >= static_cast<int>(whole->nb_streams)) {
+    const InputOwner whole = OpenForStream(path_, InputView::WholeMedia, stream);
+    if (!whole) {
         return 0.0;
     }
     const AVStream& of = *whole->streams[stream];
@@ -327,9 +326,8 @@ double MovieFile::MeanRateOfMedia(int stream) const {
 // Pictures by the time from the first to the end of the last. 0.0 for a track
 // that tells no times.
 double MovieFile::MeanRateOfPackets(int stream) {
-    std::string ignored;
-    const InputOwner input = OpenInput(path_, InputView::AsPresented, ignored);
-    if (!input || stream >= static_cast<int>(input->nb_streams)) {
+    const InputOwner input = OpenForStream(path_, InputView::AsPresented, stream);
+    if (!input) {
         return 0.0;
     }
     const std::vector<PacketEntry> packets = ListPackets(*input, stream, IndexIsWhole());
@@ -350,10 +348,8 @@ bool MovieFile::HoldsSamples(int stream) const {
     if (avformat_index_get_entries_count(input_->streams[stream]) > 0) {
         return true;
     }
-    std::string ignored;
-    const InputOwner whole = OpenInput(path_, InputView::WholeMedia, ignored);
-    return whole && stream < static_cast<int>(whole->nb_streams) &&
-           avformat_index_get_entries_count(whole->streams[stream]) > 0;
+    const InputOwner whole = OpenForStream(path_, InputView::WholeMedia, stream);
+    return whole && avformat_index_get_entries_count(whole->streams[stream]) > 0;
 }
 
 double MovieFile::PictureRate() {
@@ -387,9 +383,8 @@ ncfUInt64 MovieFile::CountPictures(ncfUInt64 enough) {
         return 0;
     }
     if (!countedAll_ && counted_ < enough) {
-        std::string ignored;
-        const InputOwner input = OpenInput(path_, InputView::AsPresented, ignored);
-        if (!input || stream >= static_cast<int>(input->nb_streams)) {
+        const InputOwner input = OpenForStream(path_, InputView::AsPresented, stream);
+        if (!input) {
             return 0;
         }
         counted_ = CountShownPackets(*input, stream, IndexIsWhole(), enough);
@@ -404,9 +399,7 @@ double MovieFile::SecondsOfPackets(int stream) {
         return known->second;
     }
     double seconds = 0.0;
-    std::string ignored;
-    const InputOwner input = OpenInput(path_, InputView::AsPresented, ignored);
-    if (input && stream < static_cast<int>(input->nb_streams)) {
+    if (const InputOwner input = OpenForStream(path_, InputView::AsPresented, stream)) {
         seconds = SecondsOf(ListPackets(*input, stream, IndexIsWhole()), *input->streams[stream]);
     }
     return secondsOfPackets_[stream] = seconds;

@@ -66,9 +66,8 @@ std::vector<std::size_t> RunEnds(const std::vector<PacketEntry>& packets) {
 
 MovieSampleTable::Track MovieSampleTable::Load(int stream) const {
     Track track;
-    std::string ignored;
-    const InputOwner input = OpenInput(source_.path, InputView::WholeMedia, ignored);
-    if (!input || stream >= static_cast<int>(input->nb_streams)) {
+    const InputOwner input = OpenForStream(source_.path, InputView::WholeMedia, stream);
+    if (!input) {
         return track;
     }
     if (IsMovieFamily(*input)) {  // its own times, untouched
@@ -143,12 +142,8 @@ NCFRESULT MovieSampleTable::ForSample(ncfUInt32 track, ncfUInt64 sample, Out* ou
     const std::lock_guard<std::mutex> lock(mutex_);
     return Guarded([&] {
         const Track* const found = Find(track);
-        if (!found) {
-            return NCF_E_NOTFOUND;
-        }
-        if (sample == 0 || sample > found->samples) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(found, NCF_E_NOTFOUND);
+        Need(sample != 0 && sample <= found->samples, NCF_E_INVALIDARG);
         const Place place = PlaceOf(*found, sample);
         *out = static_cast<Out>(value(*found, found->packets[place.packet], place));
         return NCF_OK;
@@ -181,9 +176,7 @@ NCFRESULT MovieSampleTable::GetNumSamples(ncfUInt32 track, ncfUInt64* n) {
     const std::lock_guard<std::mutex> lock(mutex_);
     return Guarded([&] {
         const Track* const found = Find(track);
-        if (!found) {
-            return NCF_E_NOTFOUND;
-        }
+        Need(found, NCF_E_NOTFOUND);
         *n = found->samples;
         return NCF_OK;
     });

@@ -177,6 +177,13 @@ std::string FindFault(const AVFormatContext& input) {
 
 }  // namespace
 
+InputOwner OpenForStream(const std::filesystem::path& path, InputView view, int stream) {
+    std::string ignored;
+    InputOwner input = OpenInput(path, view, ignored);
+    return input && stream >= 0 && stream < static_cast<int>(input->nb_streams) ? std::move(input)
+                                                                                : nullptr;
+}
+
 std::string TooManyChannels() {
     return "the sound tracks of the movie have more than " + std::to_string(kMostChannelsOfMovie) +
            " channels in total";

@@ -20,6 +20,10 @@ enum class InputView {
 // ever read: lists of other files, picture sequences and the like lead nowhere.
 InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::string& reason);
 
+// The same for who wants one stream of it: null, too, where it has none of that
+// number.
+InputOwner OpenForStream(const std::filesystem::path& path, InputView view, int stream);
+
 // The most channels of all sound tracks of a movie together, the header parser's
 // limit too, and the sentence for a movie that has more.
 inline constexpr int kMostChannelsOfMovie = 1024;

@@ -200,11 +200,10 @@ std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool in
 }
 
 bool AreStoredPlain(const std::filesystem::path& path, int stream, int count) {
-    std::string ignored;
-    const InputOwner input = OpenInput(path, InputView::WholeMedia, ignored);
+    const InputOwner input = OpenForStream(path, InputView::WholeMedia, stream);
     std::ifstream file(path, std::ios::binary);
     const PacketOwner packet(av_packet_alloc());
-    if (!input || !file || !packet || stream >= static_cast<int>(input->nb_streams)) {
+    if (!input || !file || !packet) {
         return false;
     }
     UseOneStream(*input, stream);

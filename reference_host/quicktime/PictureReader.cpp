@@ -55,9 +55,8 @@ bool IsDamaged(const AVFrame& frame) {
 
 std::unique_ptr<PictureReader> PictureReader::Open(const std::filesystem::path& path, int stream,
                                                    bool indexIsWhole) {
-    std::string ignored;
-    InputOwner input = OpenInput(path, InputView::AsPresented, ignored);
-    if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
+    InputOwner input = OpenForStream(path, InputView::AsPresented, stream);
+    if (!input) {
         return nullptr;
     }
     if (TellsLargePictures(*input->streams[stream]->codecpar) &&
@@ -160,9 +159,7 @@ NCFRESULT PictureReader::StartAt(std::size_t packet) {
         av_seek_frame(input_.get(), stream_, entry.decodeTime, AVSEEK_FLAG_BACKWARD) >= 0 &&
         LandsBefore(packet);
     if (!isRunning_) {  // some files can only be read from their start
-        std::string ignored;
-        if (InputOwner again = OpenInput(path_, InputView::AsPresented, ignored);
-            again && stream_ < static_cast<int>(again->nb_streams)) {
+        if (InputOwner again = OpenForStream(path_, InputView::AsPresented, stream_)) {
             input_ = std::move(again);
             UseOneStream(*input_, stream_);
             isRunning_ = LandsBefore(packet);
@@ -237,7 +234,7 @@ NCFRESULT PictureReader::DecodeUpTo(std::size_t picture, std::shared_ptr<const A
         lastOut_ = *number;
         std::shared_ptr<const AVFrame> kept;
         if (!IsDamaged(*frame)) {
-            kept = std::shared_ptr<AVFrame>(frame.release(), FreeFrame());
+            kept = std::move(frame);
             cache_.Keep(*number, kept, picture, mostKept_);
         }
         if (*number == picture) {

@@ -18,15 +18,10 @@ NCFRESULT QuickTimeProperty::CreateMovie(INCFString* path) {
     pixels_.reset();
     return Guarded([&] {
         std::filesystem::path file;
-        const NCFRESULT read = PathFrom(path, file);
-        if (read < 0) {
-            return read;
-        }
+        Check(PathFrom(path, file));
         std::string reason;
         const auto movie = MovieFile::Open(file, reason);
-        if (!movie) {
-            return NCF_E_FAIL;
-        }
+        Need(movie, NCF_E_FAIL);
         const ncfUInt32 track = movie->FirstVideo();
         pixels_ = std::make_unique<CodecPixels>();
         if (track != 0) {
@@ -39,22 +34,15 @@ NCFRESULT QuickTimeProperty::CreateMovie(INCFString* path) {
 
 NCFRESULT QuickTimeProperty::GetCodecPixelFormats(INCFBuffer** codes, ncfUInt32* count) {
     const std::lock_guard<std::mutex> lock(mutex_);
-    if (!codes || !count) {
-        return NCF_E_POINTER;
-    }
-    *codes = nullptr;
-    if (!pixels_) {
-        return NMA_E_NOTINITIALIZED;
-    }
     return Guarded([&] {
+        Need(codes && count);
+        *codes = nullptr;
+        Need(pixels_, NMA_E_NOTINITIALIZED);
         const std::size_t bytes = pixels_->layouts.size() * sizeof(ncfUInt32);
         const Ref<Buffer> buffer = MakeRef<Buffer>();
         void* start = nullptr;
-        NCFRESULT result = buffer->Allocate(bytes, alignof(ncfUInt32));
-        result = result < 0 ? result : buffer->GetBufferPointer(&start);
-        if (result < 0) {
-            return result;
-        }
+        Check(buffer->Allocate(bytes, alignof(ncfUInt32)));
+        Check(buffer->GetBufferPointer(&start));
         if (bytes > 0) {
             std::memcpy(start, pixels_->layouts.data(), bytes);
         }
@@ -65,40 +53,27 @@ NCFRESULT QuickTimeProperty::GetCodecPixelFormats(INCFBuffer** codes, ncfUInt32*
 }
 
 NCFRESULT QuickTimeProperty::GetCodecName(ncfUInt32 codecType, INCFString* name) {
-    if (!name) {
-        return NCF_E_POINTER;
-    }
-    std::string text;
-    const NCFRESULT result = CodecName(codecType, text);
-    if (result < 0) {
-        return result;
-    }
-    return name->AssignUTF8(kNCFUTF8, text.c_str(), static_cast<ncfUInt32>(text.size()));
+    return Guarded([&] {
+        Need(name);
+        std::string text;
+        Check(CodecName(codecType, text));
+        return name->AssignUTF8(kNCFUTF8, text.c_str(), static_cast<ncfUInt32>(text.size()));
+    });
+}
+
+NCFRESULT QuickTimeProperty::GiveOfCodec(ncfUInt32 CodecPixels::*fact, ncfUInt32* out) {
+    const std::lock_guard<std::mutex> lock(mutex_);
+    return out && !pixels_ ? NMA_E_NOTINITIALIZED
+                           : Give(fact && pixels_ ? (*pixels_).*fact : 0, out);
 }
 
 NCFRESULT QuickTimeProperty::GetCodecStorageType(ncfUInt32* type) {
-    const std::lock_guard<std::mutex> lock(mutex_);
-    if (!type) {
-        return NCF_E_POINTER;
-    }
-    if (!pixels_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    *type = pixels_->storage;
-    return NCF_OK;
+    return GiveOfCodec(&CodecPixels::storage, type);
 }
 
 // 'BGRA' comes in full range always.
 NCFRESULT QuickTimeProperty::DoesCodecSupportRGB_CCIR(ncfUInt32* flag) {
-    const std::lock_guard<std::mutex> lock(mutex_);
-    if (!flag) {
-        return NCF_E_POINTER;
-    }
-    if (!pixels_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    *flag = 0;
-    return NCF_OK;
+    return GiveOfCodec(nullptr, flag);
 }
 
 }  // namespace host

@@ -23,6 +23,8 @@ public:
     NCFRESULT DoesCodecSupportRGB_CCIR(ncfUInt32* flag) override;
 
 private:
+    NCFRESULT GiveOfCodec(ncfUInt32 CodecPixels::*fact, ncfUInt32* out);
+
     std::mutex mutex_;
     std::unique_ptr<CodecPixels> pixels_;  // null until a movie is open
 };

@@ -13,14 +13,22 @@
 
 namespace host {
 
+MovieFile& QuickTimeWrapper::Movie() const {
+    Need(movie_, NMA_E_NOTINITIALIZED);
+    return *movie_;
+}
+
+const AVStream& QuickTimeWrapper::Track(ncfUInt32 track) const {
+    const AVStream* const stream = Movie().FindTrack(track);
+    Need(stream, NCF_E_NOTFOUND);
+    return *stream;
+}
+
 NCFRESULT QuickTimeWrapper::NewMovieFromFilePath(INCFString* path) {
     movie_.reset();
     return Guarded([&] {
         std::filesystem::path file;
-        const NCFRESULT read = PathFrom(path, file);
-        if (read < 0) {
-            return read;
-        }
+        Check(PathFrom(path, file));
         std::string reason;
         movie_ = MovieFile::Open(file, reason);
         return movie_ ? NCF_OK : NCF_E_FAIL;
@@ -35,14 +43,10 @@ NCFRESULT QuickTimeWrapper::PreparePixelFormat(ncfUInt32 fourCC) {
 }
 
 NCFRESULT QuickTimeWrapper::GetSampleTable(QTWrapper::IQTWSampleTable** table) {
-    if (!table) {
-        return NCF_E_POINTER;
-    }
-    *table = nullptr;
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
     return Guarded([&] {
+        Need(table);
+        *table = nullptr;
+        Need(movie_, NMA_E_NOTINITIALIZED);
         MovieSampleTable::Source source;
         source.path = movie_->Path();
         source.streams = movie_->StreamsByTrack();
@@ -58,14 +62,10 @@ NCFRESULT QuickTimeWrapper::GetSampleTable(QTWrapper::IQTWSampleTable** table) {
 }
 
 NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader) {
-    if (!reader) {
-        return NCF_E_POINTER;
-    }
-    *reader = nullptr;
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
     return Guarded([&] {
+        Need(reader);
+        *reader = nullptr;
+        Need(movie_, NMA_E_NOTINITIALIZED);
         std::map<ncfUInt32, EditedSound::Source> streams;
         for (const auto& [track, stream] : movie_->StreamsByTrack()) {
             if (movie_->IsAudio(track)) {
@@ -80,9 +80,7 @@ NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader)
                 }
             }
         }
-        if (streams.empty()) {
-            return NMA_E_NODATA;
-        }
+        Need(!streams.empty(), NMA_E_NODATA);
         *reader = MakeRef<AudioReader>(movie_->Path(), std::move(streams), movie_->IndexIsWhole())
                       .Detach();
         return NCF_OK;
@@ -90,18 +88,12 @@ NCFRESULT QuickTimeWrapper::GetQTAudioReader(QTWrapper::IQTAudioReader** reader)
 }
 
 NCFRESULT QuickTimeWrapper::GetQTVideoReader(QTWrapper::IQTVideoReader** reader) {
-    if (!reader) {
-        return NCF_E_POINTER;
-    }
-    *reader = nullptr;
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
     return Guarded([&] {
+        Need(reader);
+        *reader = nullptr;
+        Need(movie_, NMA_E_NOTINITIALIZED);
         const ncfUInt32 track = movie_->FirstVideo();
-        if (track == 0) {
-            return NMA_E_NODATA;
-        }
+        Need(track != 0, NMA_E_NODATA);
         VideoReader::Source source;
         source.path = movie_->Path();
         source.stream = movie_->StreamOf(track);
@@ -146,26 +138,13 @@ ncfBool QuickTimeWrapper::GetFirstVideoTrack(ncfUInt32* track) {
 }
 
 ncfBool QuickTimeWrapper::MovieHasMultipleVideoTracks(ncfUInt32, ncfUInt32) {
-    if (!movie_) {
-        return 0;
-    }
-    int count = 0;
-    for (const ncfUInt32 track : movie_->Numbers()) {
-        count += movie_->IsVideo(track);
-    }
-    return count > 1;
+    return movie_ && std::count_if(movie_->Numbers().begin(), movie_->Numbers().end(),
+                                   [this](ncfUInt32 track) { return movie_->IsVideo(track); }) > 1;
 }
 
 ncfUInt32 QuickTimeWrapper::MovieIsSelfContained(ncfUInt32, ncfUInt32, ncfUInt32) {
-    if (!movie_) {
-        return 0;
-    }
-    for (const MovieAtoms::Track& track : movie_->Atoms().tracks) {
-        if (track.needsOtherFiles) {
-            return 0;
-        }
-    }
-    return 1;
+    return movie_ && std::none_of(movie_->Atoms().tracks.begin(), movie_->Atoms().tracks.end(),
+                                  [](const auto& track) { return track.needsOtherFiles; });
 }
 
 }  // namespace host

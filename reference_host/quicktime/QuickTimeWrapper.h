@@ -65,9 +65,12 @@ public:
     ncfUInt32 GetMovieTimeScale() override;
 
 private:
+    // Within a guarded body: ends it without a movie, without such a track.
+    MovieFile& Movie() const;
+    const AVStream& Track(ncfUInt32 track) const;
     NCFRESULT EditRateAndLength(double forcedRate, double editorRate, ncfUInt32 singleFrameDuration,
                                 bool useMovieHeader, double& rate, ncfUInt64& length);
-    const AVStream* DetailedFirstVideo() const;
+    const AVStream& DetailedFirstVideo() const;
 
     std::unique_ptr<MovieFile> movie_;  // null until a movie is open
 };

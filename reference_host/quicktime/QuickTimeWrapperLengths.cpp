@@ -85,20 +85,13 @@ NCFRESULT QuickTimeWrapper::DetermineMovieEditRateAndLength(
     double forcedRate, double editorRate, ncfUInt32 singleFrameDuration, ncfSInt32* num,
     ncfSInt32* den, ncfUInt64* length, ncfUInt64* trackLengths, ncfUInt32 trackLengthCount,
     ncfBool useMovieHeader) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!num || !den || !length) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(num && den && length);
         double rate = 0.0;
         ncfUInt64 units = 0;
-        const NCFRESULT found = EditRateAndLength(forcedRate, editorRate, singleFrameDuration,
-                                                  useMovieHeader != 0, rate, units);
-        if (found < 0) {
-            return found;
-        }
+        Check(EditRateAndLength(forcedRate, editorRate, singleFrameDuration, useMovieHeader != 0,
+                                rate, units));
         const Rate snapped = SnappedRate(rate);
         *num = snapped.numerator;
         *den = snapped.denominator;
@@ -114,13 +107,9 @@ NCFRESULT QuickTimeWrapper::DetermineMovieEditRateAndLength(
 NCFRESULT QuickTimeWrapper::MovieTrackDurationIssues(ncfSInt32 rateNum, ncfSInt32 rateDen,
                                                      ncfUInt64 length, ncfBool* sound,
                                                      ncfBool* picture) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (rateNum <= 0 || rateDen <= 0) {
-        return NCF_E_INVALIDARG;
-    }
     return Guarded([&] {
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(rateNum > 0 && rateDen > 0, NCF_E_INVALIDARG);
         bool soundDiffers = false;
         bool pictureDiffers = false;
         if (length != 0) {
@@ -134,12 +123,8 @@ NCFRESULT QuickTimeWrapper::MovieTrackDurationIssues(ncfSInt32 rateNum, ncfSInt3
             pictureDiffers =
                 movie_->FirstVideo() != 0 && movie_->CountPictures(~ncfUInt64{0}) != length;
         }
-        if (sound) {
-            *sound = soundDiffers;
-        }
-        if (picture) {
-            *picture = pictureDiffers;
-        }
+        Give(soundDiffers, sound);
+        Give(pictureDiffers, picture);
         return NCF_OK;
     });
 }

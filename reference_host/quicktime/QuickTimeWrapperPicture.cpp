@@ -25,29 +25,21 @@ bool IsTopFirst(AVFieldOrder order) {
 
 }  // namespace
 
-const AVStream* QuickTimeWrapper::DetailedFirstVideo() const {
-    const ncfUInt32 track = movie_->FirstVideo();
-    return track == 0 ? nullptr : movie_->FindDetailedTrack(track);
+const AVStream& QuickTimeWrapper::DetailedFirstVideo() const {
+    const ncfUInt32 track = Movie().FirstVideo();
+    Need(track != 0, NCF_E_NOTFOUND);
+    return *movie_->FindDetailedTrack(track);
 }
 
 NCFRESULT QuickTimeWrapper::QueryVideoDescBufferDetails(ncfUInt32* interlaced, ncfUInt32* bits) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!interlaced || !bits) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
-        const AVStream* const stream = DetailedFirstVideo();
-        if (!stream) {
-            return NCF_E_NOTFOUND;
-        }
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(interlaced && bits);
+        const AVCodecParameters& form = *DetailedFirstVideo().codecpar;
         const AVFieldOrder told = movie_->ContainerFieldOrder(movie_->FirstVideo());
         const bool isTold = told != AV_FIELD_UNKNOWN;
-        const AVFieldOrder order = isTold ? told : stream->codecpar->field_order;
-        if (order == AV_FIELD_UNKNOWN) {
-            return NMA_E_FIELDS;
-        }
+        const AVFieldOrder order = isTold ? told : form.field_order;
+        Need(order != AV_FIELD_UNKNOWN, NMA_E_FIELDS);
         *interlaced = order != AV_FIELD_PROGRESSIVE;
         *bits = 0;
         if (order != AV_FIELD_PROGRESSIVE) {
@@ -76,18 +68,11 @@ ncfBool QuickTimeWrapper::GetFieldLayoutForTrack(ncfUInt32 track, ncfUInt32* fie
 }
 
 NCFRESULT QuickTimeWrapper::GetCodecColorSpaceInfo(ncfBool* found709, ncfBool* found601) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!found709 || !found601) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
-        const AVStream* const stream = DetailedFirstVideo();
-        if (!stream) {
-            return NCF_E_NOTFOUND;
-        }
-        const AVColorSpace space = stream->codecpar->color_space;
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(found709 && found601);
+        const AVCodecParameters& form = *DetailedFirstVideo().codecpar;
+        const AVColorSpace space = form.color_space;
         *found709 = space == AVCOL_SPC_BT709 || space == AVCOL_SPC_SMPTE240M;
         *found601 = space == AVCOL_SPC_BT470BG || space == AVCOL_SPC_SMPTE170M;
         return NCF_OK;
@@ -104,33 +89,21 @@ ncfBool QuickTimeWrapper::MovieHasOneFrame() {
 }
 
 NCFRESULT QuickTimeWrapper::MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!alpha) {
-        return NCF_E_POINTER;
-    }
-    if (kind != QTWrapper::kAlphaCheckForImport && kind != QTWrapper::kAlphaCheckForQTNMA) {
-        return NCF_E_INVALIDARG;
-    }
     return Guarded([&] {
-        const AVStream* const stream = DetailedFirstVideo();
-        if (!stream) {
-            return NCF_E_NOTFOUND;
-        }
-        const AVCodecParameters& form = *stream->codecpar;
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(alpha);
+        Need(kind == QTWrapper::kAlphaCheckForImport || kind == QTWrapper::kAlphaCheckForQTNMA,
+             NCF_E_INVALIDARG);
+        const AVCodecParameters& form = *DetailedFirstVideo().codecpar;
         bool found = form.codec_id == AV_CODEC_ID_GIF;
         if (kind == QTWrapper::kAlphaCheckForImport) {
             found =
                 found || HasAlphaComponent(static_cast<AVPixelFormat>(form.format)) ||
                 (IsMovieFamily(movie_->Input()) && form.bits_per_coded_sample == kDepthWithAlpha);
         } else if (!found) {
-            std::string ignored;
-            const InputOwner input = OpenInput(movie_->Path(), InputView::AsPresented, ignored);
             const int index = movie_->StreamOf(movie_->FirstVideo());
-            const FrameOwner frame = input && index < static_cast<int>(input->nb_streams)
-                                         ? DecodeFirstPicture(*input, index)
-                                         : nullptr;
+            const InputOwner input = OpenForStream(movie_->Path(), InputView::AsPresented, index);
+            const FrameOwner frame = input ? DecodeFirstPicture(*input, index) : nullptr;
             found = frame && ShowsAlpha(*frame);
         }
         *alpha = found;
@@ -140,33 +113,25 @@ NCFRESULT QuickTimeWrapper::MovieContainsAlpha(ncfUInt32 kind, ncfBool* alpha) {
 
 NCFRESULT QuickTimeWrapper::GetMovieBox(ncfUInt32* width, ncfUInt32* height, ncfUInt32* aspectNum,
                                         ncfUInt32* aspectDen) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!width || !height) {
-        return NCF_E_POINTER;
-    }
-    const MovieFile::Raster raster = movie_->RasterOf(movie_->FirstVideo());
-    if (raster.width <= 0 || raster.height <= 0) {
-        return NCF_E_NOTFOUND;
-    }
-    *width = static_cast<ncfUInt32>(raster.width);
-    *height = static_cast<ncfUInt32>(raster.height);
-    const AVRational told = raster.pixelAspect;
-    std::optional<header_parser::Ratio> pixel;
-    if (told.num > 0 && told.den > 0) {
-        pixel = header_parser::Ratio{static_cast<ncfUInt32>(told.num),
-                                     static_cast<ncfUInt32>(told.den)};
-    }
-    const header_parser::Ratio aspect =
-        header_parser::ImageAspect(*width, *height, std::nullopt, pixel);
-    if (aspectNum) {
-        *aspectNum = aspect.numerator;
-    }
-    if (aspectDen) {
-        *aspectDen = aspect.denominator;
-    }
-    return NCF_OK;
+    return Guarded([&] {
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(width && height);
+        const MovieFile::Raster raster = movie_->RasterOf(movie_->FirstVideo());
+        Need(raster.width > 0 && raster.height > 0, NCF_E_NOTFOUND);
+        *width = static_cast<ncfUInt32>(raster.width);
+        *height = static_cast<ncfUInt32>(raster.height);
+        const AVRational told = raster.pixelAspect;
+        std::optional<header_parser::Ratio> pixel;
+        if (told.num > 0 && told.den > 0) {
+            pixel = header_parser::Ratio{static_cast<ncfUInt32>(told.num),
+                                         static_cast<ncfUInt32>(told.den)};
+        }
+        const header_parser::Ratio aspect =
+            header_parser::ImageAspect(*width, *height, std::nullopt, pixel);
+        Give(aspect.numerator, aspectNum);
+        Give(aspect.denominator, aspectDen);
+        return NCF_OK;
+    });
 }
 
 // Frames come out at their stored size always, whatever the box. Its 16 bits hold

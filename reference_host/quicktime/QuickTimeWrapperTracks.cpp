@@ -16,14 +16,6 @@ extern "C" {
 namespace host {
 namespace {
 
-// Fills an output that may be null.
-template <class Out, class Value>
-void Give(Out* out, Value value) {
-    if (out) {
-        *out = static_cast<Out>(value);
-    }
-}
-
 // A code as the library prints it: characters, and "[n]" for those that are
 // none. The first is in the top byte; 0 for a text that is no such code.
 ncfUInt32 CodeFromText(const char* text) {
@@ -44,24 +36,16 @@ ncfUInt32 CodeFromText(const char* text) {
 }  // namespace
 
 NCFRESULT QuickTimeWrapper::GetFourCCFromImageDescrptor(ncfUInt32 track, ncfUInt8* fourBytes) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!fourBytes) {
-        return NCF_E_POINTER;
-    }
-    const AVStream* const stream = movie_->FindTrack(track);
-    if (!stream) {
-        return NCF_E_NOTFOUND;
-    }
-    const ncfUInt32 code = CodecCode(*stream->codecpar);
-    if (code == 0) {
-        return NCF_E_FAIL;
-    }
-    for (int i = 0; i < 4; ++i) {
-        fourBytes[i] = static_cast<ncfUInt8>(code >> (24 - 8 * i));
-    }
-    return NCF_OK;
+    return Guarded([&] {
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(fourBytes);
+        const ncfUInt32 code = CodecCode(*Track(track).codecpar);
+        Need(code != 0, NCF_E_FAIL);
+        for (int i = 0; i < 4; ++i) {
+            fourBytes[i] = static_cast<ncfUInt8>(code >> (24 - 8 * i));
+        }
+        return NCF_OK;
+    });
 }
 
 ncfUInt32 QuickTimeWrapper::GetImageDescriptionCount(ncfUInt32 track) {
@@ -79,36 +63,23 @@ ncfUInt32 QuickTimeWrapper::GetResolutionId(ncfUInt32) {
 }
 
 NCFRESULT QuickTimeWrapper::GetCodecTypeName(ncfUInt32 track, INCFString* name) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!name) {
-        return NCF_E_POINTER;
-    }
     return Guarded([&] {
-        const AVStream* const stream = movie_->FindTrack(track);
-        if (!stream) {
-            return NCF_E_NOTFOUND;
-        }
-        const std::string text = CodecNameOf(*stream->codecpar);
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(name);
+        const std::string text = CodecNameOf(*Track(track).codecpar);
         return name->AssignUTF8(kNCFUTF8, text.c_str(), static_cast<ncfUInt32>(text.size()));
     });
 }
 
 NCFRESULT QuickTimeWrapper::GetVendor(ncfUInt32 track, ncfUInt32* vendor) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!vendor) {
-        return NCF_E_POINTER;
-    }
-    const AVStream* const stream = movie_->FindTrack(track);
-    if (!stream) {
-        return NCF_E_NOTFOUND;
-    }
-    const AVDictionaryEntry* const entry = av_dict_get(stream->metadata, "vendor_id", nullptr, 0);
-    *vendor = entry ? CodeFromText(entry->value) : 0;
-    return NCF_OK;
+    return Guarded([&] {
+        Need(movie_, NMA_E_NOTINITIALIZED);
+        Need(vendor);
+        const AVDictionaryEntry* const entry =
+            av_dict_get(Track(track).metadata, "vendor_id", nullptr, 0);
+        *vendor = entry ? CodeFromText(entry->value) : 0;
+        return NCF_OK;
+    });
 }
 
 NCFRESULT QuickTimeWrapper::GetAudioInfoForTrack(ncfUInt32 track, ncfUInt32* channels,
@@ -117,32 +88,21 @@ NCFRESULT QuickTimeWrapper::GetAudioInfoForTrack(ncfUInt32 track, ncfUInt32* cha
                                                  ncfUInt32* framesPerPacket,
                                                  ncfUInt32* bitsPerChannel, ncfUInt8* isBigEndian,
                                                  ncfUInt8* isConstantBitRate) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    const AVStream* const stream = movie_->FindTrack(track);
-    if (!stream) {
-        return NCF_E_NOTFOUND;
-    }
-    SoundForm form;
-    const NCFRESULT found = Guarded([&] {
-        const SoundForm* const known = movie_->SoundFormOf(track);
-        form = known ? *known : form;
-        return known ? NCF_OK : NCF_E_FAIL;
+    return Guarded([&] {
+        Track(track);
+        const SoundForm* const form = movie_->SoundFormOf(track);
+        Need(form, NCF_E_FAIL);
+        Give(form->channels, channels);
+        Give(form->sampleRate, sampleRate);
+        Give(form->formatId, formatID);
+        Give(form->formatFlags, formatFlags);
+        Give(form->bytesPerPacket, bytesPerPacket);
+        Give(form->framesPerPacket, framesPerPacket);
+        Give(form->bitsPerChannel, bitsPerChannel);
+        Give(form->isBigEndian, isBigEndian);
+        Give(form->isConstantBitRate, isConstantBitRate);
+        return NCF_OK;
     });
-    if (found < 0) {
-        return found;
-    }
-    Give(channels, form.channels);
-    Give(sampleRate, form.sampleRate);
-    Give(formatID, form.formatId);
-    Give(formatFlags, form.formatFlags);
-    Give(bytesPerPacket, form.bytesPerPacket);
-    Give(framesPerPacket, form.framesPerPacket);
-    Give(bitsPerChannel, form.bitsPerChannel);
-    Give(isBigEndian, form.isBigEndian);
-    Give(isConstantBitRate, form.isConstantBitRate);
-    return NCF_OK;
 }
 
 NCFRESULT QuickTimeWrapper::GetTimeCodeInfoForTrack(ncfUInt32 track, ncfUInt8* hours,
@@ -150,25 +110,20 @@ NCFRESULT QuickTimeWrapper::GetTimeCodeInfoForTrack(ncfUInt32 track, ncfUInt8* h
                                                     ncfUInt8* frames, ncfUInt32* timeScale,
                                                     ncfUInt32* frameDuration, ncfUInt32* drop,
                                                     ncfUInt32* numFrames) {
-    if (!movie_) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    if (!movie_->IsTimecode(track)) {
-        return NCF_E_NOTFOUND;
-    }
-    TimecodeStart start;
-    if (!ReadTimecodeStart(*movie_->FindTrack(track), start)) {
-        return NCF_E_FAIL;
-    }
-    Give(hours, start.hours);
-    Give(minutes, start.minutes);
-    Give(seconds, start.seconds);
-    Give(frames, start.frames);
-    Give(timeScale, start.timeScale);
-    Give(frameDuration, start.frameDuration);
-    Give(drop, start.isDropFrame);
-    Give(numFrames, start.framesPerSecond);
-    return NCF_OK;
+    return Guarded([&] {
+        TimecodeStart start;
+        Need(Movie().IsTimecode(track), NCF_E_NOTFOUND);
+        Need(ReadTimecodeStart(Track(track), start), NCF_E_FAIL);
+        Give(start.hours, hours);
+        Give(start.minutes, minutes);
+        Give(start.seconds, seconds);
+        Give(start.frames, frames);
+        Give(start.timeScale, timeScale);
+        Give(start.frameDuration, frameDuration);
+        Give(start.isDropFrame, drop);
+        Give(start.framesPerSecond, numFrames);
+        return NCF_OK;
+    });
 }
 
 }  // namespace host

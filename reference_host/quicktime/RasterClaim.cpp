@@ -96,9 +96,8 @@ std::int64_t MostPixels(const AVCodecParameters& form) {
 }
 
 std::string FindImpossibleRaster(const std::filesystem::path& path, int stream) {
-    std::string ignored;
-    const InputOwner input = OpenInput(path, InputView::AsPresented, ignored);
-    if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
+    const InputOwner input = OpenForStream(path, InputView::AsPresented, stream);
+    if (!input) {
         return {};
     }
     const AVCodecParameters& form = *input->streams[stream]->codecpar;

@@ -74,9 +74,8 @@ ncfSInt64 StartOf(const AVFormatContext& input) {
 std::unique_ptr<SoundDecoder> SoundDecoder::Open(const std::filesystem::path& path, int stream,
                                                  const SoundForm& form, bool hasWholeIndex,
                                                  InputView view) {
-    std::string ignored;
-    InputOwner input = OpenInput(path, view, ignored);
-    if (!input || stream < 0 || stream >= static_cast<int>(input->nb_streams)) {
+    InputOwner input = OpenForStream(path, view, stream);
+    if (!input) {
         return nullptr;
     }
     if (!hasWholeIndex) {
@@ -151,9 +150,8 @@ ncfSInt64 SoundDecoder::Preroll() const {
 }
 
 void SoundDecoder::Rewind() {
-    std::string ignored;
-    InputOwner again = OpenInput(path_, view_, ignored);
-    isRunning_ = again && stream_ < static_cast<int>(again->nb_streams);
+    InputOwner again = OpenForStream(path_, view_, stream_);
+    isRunning_ = again != nullptr;
     if (isRunning_) {
         input_ = std::move(again);
         UseOneStream(*input_, stream_);

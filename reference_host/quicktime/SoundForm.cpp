@@ -17,12 +17,7 @@ extern "C" {
 namespace host {
 namespace {
 
-constexpr ncfUInt32 Code(const char (&text)[5]) {
-    return static_cast<ncfUInt32>(static_cast<unsigned char>(text[0])) << 24 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[1])) << 16 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[2])) << 8 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[3]));
-}
+using header_parser::Code;
 
 constexpr ncfUInt32 kFloat = 1;
 constexpr ncfUInt32 kBigEndian = 2;

@@ -5,13 +5,12 @@
 
 #include <algorithm>
 #include <array>
-#include <cstring>
-#include <fstream>
 #include <limits>
 #include <utility>
 #include <vector>
 
 #include "reference_host/header_parser/Movie.h"
+#include "reference_host/header_parser/StoredAtom.h"
 
 // Atoms are walked as the library walks them, which forgives much: an atom that
 // ends behind its parent ends with it, and unknown ones are stepped over.
@@ -19,78 +18,26 @@
 namespace host {
 namespace {
 
+using header_parser::ByteSource;
 using header_parser::Code;
-using header_parser::LoadU32;
-using header_parser::LoadU64;
+using header_parser::StoredAtom;
+using header_parser::StoredAtoms;
+using header_parser::StoredEntries;
+using header_parser::StoredTable;
 
 constexpr int kDeepest = 12;
-// Entries that are read at a time.
-constexpr ncfUInt64 kPiece = 4096;
 // Sound is indexed in pieces of as many samples at least.
 constexpr ncfUInt64 kSamplesOfASoundPiece = 160;
 constexpr ncfUInt64 kMostHeaderToUnpack = ncfUInt64{64} << 20;
-
-// Bytes of a file, or of a header that was unpacked from it.
-class Source {
-public:
-    virtual ~Source() = default;
-    virtual ncfUInt64 Length() const = 0;
-    virtual bool Read(ncfUInt64 position, ncfUInt8* to, std::size_t size) = 0;
-};
-
-class FileSource final : public Source {
-public:
-    explicit FileSource(const std::filesystem::path& path) : stream_(path, std::ios::binary) {
-        stream_.seekg(0, std::ios::end);
-        const std::streamoff end = stream_.tellg();
-        length_ = end > 0 ? static_cast<ncfUInt64>(end) : 0;
-    }
-    ncfUInt64 Length() const override { return length_; }
-    bool Read(ncfUInt64 position, ncfUInt8* to, std::size_t size) override {
-        if (position > length_ || size > length_ - position) {
-            return false;
-        }
-        stream_.clear();
-        stream_.seekg(static_cast<std::streamoff>(position));
-        return static_cast<bool>(
-            stream_.read(reinterpret_cast<char*>(to), static_cast<std::streamsize>(size)));
-    }
-
-private:
-    std::ifstream stream_;
-    ncfUInt64 length_ = 0;
-};
-
-class MemorySource final : public Source {
-public:
-    explicit MemorySource(header_parser::HeaderBytes bytes) : bytes_(std::move(bytes)) {}
-    ncfUInt64 Length() const override { return bytes_.Size(); }
-    bool Read(ncfUInt64 position, ncfUInt8* to, std::size_t size) override {
-        if (position > Length() || size > Length() - position) {
-            return false;
-        }
-        std::memcpy(to, bytes_.begin() + position, size);
-        return true;
-    }
-
-private:
-    header_parser::HeaderBytes bytes_;
-};
-
-// A table of entries of one size.
-struct Table {
-    ncfUInt64 position = 0;
-    ncfUInt64 count = 0;  // that the atom really holds
-};
 
 // What a track's tables say before they are put together.
 struct TrackTables {
     ncfUInt64 samples = 0;
     ncfUInt64 chunks = 0;
-    Table durations;  // stts: samples, time units
-    Table runs;       // stsc: first chunk, samples of a chunk, description
-    Table syncs;      // stss
-    Table edits;      // elst
+    StoredTable durations;  // stts: samples, time units
+    StoredTable runs;       // stsc: first chunk, samples of a chunk, description
+    StoredTable syncs;      // stss
+    StoredTable edits;      // elst
     bool hasLongEdits = false;
     bool isSound = false;
     ncfUInt32 timeScale = 0;
@@ -104,56 +51,40 @@ class Walker {
 public:
     // `fileLength`: of the file that the bytes come from. `isPlain`: the bytes came
     // out of a packed header, and none is packed twice.
-    Walker(Source& source, ncfUInt64 fileLength, bool isPlain)
+    Walker(ByteSource& source, ncfUInt64 fileLength, bool isPlain)
         : source_(source),
           fileLength_(fileLength),
           isPlain_(isPlain),
           limit_(std::max(fileLength, kClaimsAlwaysFine)) {}
 
     std::string Run() {
-        Walk(0, source_.Length(), 0);
+        Walk(StoredAtoms(source_), 0);
         return problem_;
     }
 
 private:
-    ncfUInt32 Number(ncfUInt64 position) {
-        ncfUInt8 bytes[4] = {};
-        return source_.Read(position, bytes, sizeof bytes) ? LoadU32(bytes) : 0;
+    // Whether an atom is of version 1, whose numbers are of 64 bits.
+    bool IsLong(const StoredAtom& atom) { return source_.U32(atom.begin) >> 24 == 1; }
+
+    // What a header atom tells behind version, flags and two dates.
+    ncfUInt32 NumberIn(const StoredAtom& header) {
+        return source_.U32(header.begin + (IsLong(header) ? 20 : 12));
     }
 
-    // Whether an atom is of version 1, whose numbers are of 64 bits.
-    bool IsLong(ncfUInt64 position) { return Number(position) >> 24 == 1; }
-
-    void Walk(ncfUInt64 position, ncfUInt64 end, int depth) {
-        ncfUInt8 head[16];
-        while (problem_.empty() && depth < kDeepest && end - position >= 8 &&
-               source_.Read(position, head, 8)) {
-            ncfUInt64 size = LoadU32(head);
-            ncfUInt64 body = 8;
-            if (size == 1 && end - position >= 16 && source_.Read(position, head, 16)) {
-                size = LoadU64(head + 8);
-                body = 16;
-            }
-            if (size == 0 || size > end - position) {
-                size = end - position;
-            }
-            if (size < body) {
-                return;
-            }
-            Visit(LoadU32(head + 4), position + body, position + size, depth);
-            position += size;
+    void Walk(StoredAtoms atoms, int depth) {
+        for (StoredAtom atom; problem_.empty() && depth < kDeepest && atoms.Next(atom);) {
+            Visit(atom, depth);
         }
     }
 
-    void Visit(ncfUInt32 code, ncfUInt64 position, ncfUInt64 end, int depth) {
-        const ncfUInt64 size = end - position;
-        switch (code) {
+    void Visit(const StoredAtom& atom, int depth) {
+        switch (atom.type) {
             case Code("trak"):
-                ReadTrack(position, end, depth);
+                ReadTrack(atom, depth);
                 return;
             case Code("cmov"):
                 if (!isPlain_) {
-                    Unpack(position, end);
+                    Unpack(atom);
                 }
                 return;
             case Code("moov"):
@@ -167,96 +98,80 @@ private:
             case Code("moof"):
             case Code("traf"):
             case Code("tref"):
-                Walk(position, end, depth + 1);
+                Walk(StoredAtoms(source_, atom.begin, atom.end), depth + 1);
                 return;
             case Code("hdlr"):
-                tables_.isSound = tables_.isSound || Number(position + 8) == Code("soun");
+                tables_.isSound = tables_.isSound || source_.U32(atom.begin + 8) == Code("soun");
                 return;
             case Code("mdhd"):
-                tables_.timeScale = Number(position + (IsLong(position) ? 20 : 12));
+                tables_.timeScale = NumberIn(atom);
                 return;
             case Code("mvhd"):
-                timeScale_ = Number(position + (IsLong(position) ? 20 : 12));
+                timeScale_ = NumberIn(atom);
                 return;
             case Code("stsz"):
             case Code("stz2"):
-                tables_.samples = std::max<ncfUInt64>(tables_.samples, Number(position + 8));
+                tables_.samples = std::max<ncfUInt64>(tables_.samples, source_.U32(atom.begin + 8));
                 return;
             case Code("stco"):
-                tables_.chunks = std::max(tables_.chunks, Entries(position, size, 4).count);
+                tables_.chunks = std::max(tables_.chunks, TableIn(atom, 4).count);
                 return;
             case Code("co64"):
-                tables_.chunks = std::max(tables_.chunks, Entries(position, size, 8).count);
+                tables_.chunks = std::max(tables_.chunks, TableIn(atom, 8).count);
                 return;
             case Code("stts"):
-                tables_.durations = Entries(position, size, 8);
+                tables_.durations = TableIn(atom, 8);
                 return;
             case Code("stsc"):
-                tables_.runs = Entries(position, size, 12);
+                tables_.runs = TableIn(atom, 12);
                 return;
             case Code("stss"):
-                tables_.syncs = Entries(position, size, 4);
+                tables_.syncs = TableIn(atom, 4);
                 return;
             case Code("elst"):
-                tables_.hasLongEdits = IsLong(position);
-                tables_.edits = Entries(position, size, tables_.hasLongEdits ? 20 : 12);
+                tables_.hasLongEdits = IsLong(atom);
+                tables_.edits = TableIn(atom, tables_.hasLongEdits ? 20 : 12);
                 return;
             case Code("ctts"):
-                Add(Claim::DisplayTimes, SumOfFirsts(Entries(position, size, 8)));
+                Add(Claim::DisplayTimes, SumOfFirsts(TableIn(atom, 8)));
                 return;
             case Code("sbgp"): {
                 // The kind of group stands in front of the count.
-                const ncfUInt64 skipped = IsLong(position) ? 8 : 4;
-                Add(Claim::Groups, SumOfFirsts(Entries(position + skipped,
-                                                       size < skipped ? 0 : size - skipped, 8)));
+                const ncfUInt64 kind = IsLong(atom) ? 8 : 4;
+                Add(Claim::Groups, SumOfFirsts({source_, atom.begin + kind, atom.end, 8}));
                 return;
             }
             case Code("tkhd"):
                 numbers_.resize(static_cast<std::size_t>(tracks_));
                 if (!numbers_.empty()) {
-                    numbers_.back() = Number(position + (IsLong(position) ? 20 : 12));
+                    numbers_.back() = NumberIn(atom);
                 }
                 return;
             case Code("tfhd"):
-                fragmentOf_ = Number(position + 4);
+                fragmentOf_ = source_.U32(atom.begin + 4);
                 return;
             case Code("trun"):
-                Add(Claim::Fragments, Number(position + 4));
+                Add(Claim::Fragments, source_.U32(atom.begin + 4));
                 return;
             default:
                 return;
         }
     }
 
-    // The table behind version, flags and count.
-    Table Entries(ncfUInt64 position, ncfUInt64 size, ncfUInt64 entry) {
-        if (size < 8) {
-            return {};
-        }
-        return {position + 8, std::min<ncfUInt64>(Number(position + 4), (size - 8) / entry)};
+    StoredTable TableIn(const StoredAtom& atom, ncfUInt64 entrySize) {
+        return {source_, atom.begin, atom.end, entrySize};
     }
 
     // Gives each entry of a table, as numbers of 32 bits.
     template <std::size_t Numbers, class Each>
-    void ForEach(const Table& table, Each each) {
-        std::vector<ncfUInt8> bytes;
-        for (ncfUInt64 i = 0; i < table.count; i += kPiece) {
-            const ncfUInt64 now = std::min(kPiece, table.count - i);
-            bytes.resize(static_cast<std::size_t>(now * Numbers * 4));
-            if (!source_.Read(table.position + i * Numbers * 4, bytes.data(), bytes.size())) {
-                return;
-            }
-            for (ncfUInt64 k = 0; k < now; ++k) {
-                std::array<ncfUInt32, Numbers> numbers;
-                for (std::size_t n = 0; n < Numbers; ++n) {
-                    numbers[n] = LoadU32(&bytes[static_cast<std::size_t>(k * Numbers + n) * 4]);
-                }
-                each(numbers);
-            }
+    void ForEach(const StoredTable& table, Each each) {
+        StoredEntries<Numbers> entries(source_, table);
+        for (std::array<ncfUInt32, Numbers> entry; entries.Next(entry);) {
+            each(entry);
         }
     }
 
-    ncfUInt64 SumOfFirsts(const Table& table) {
+    ncfUInt64 SumOfFirsts(const StoredTable& table) {
         ncfUInt64 sum = 0;
         ForEach<2>(table, [&](const std::array<ncfUInt32, 2>& entry) { sum += entry[0]; });
         return sum;
@@ -282,10 +197,10 @@ private:
         return found == numbers_.end() ? 0 : static_cast<ncfUInt64>(found - numbers_.begin()) + 1;
     }
 
-    void ReadTrack(ncfUInt64 position, ncfUInt64 end, int depth) {
+    void ReadTrack(const StoredAtom& atom, int depth) {
         const TrackTables outer = std::exchange(tables_, {});
         ++tracks_;
-        Walk(position, end, depth + 1);
+        Walk(StoredAtoms(source_, atom.begin, atom.end), depth + 1);
         Add(Claim::Samples, IndexEntries());
         if (tables_.edits.count > 0 && tables_.samples > limit_ / tables_.edits.count) {
             Add(Claim::Edits, PlayedSamples());
@@ -297,7 +212,7 @@ private:
     ncfUInt64 IndexEntries() {
         bool hasSingleSamples = tables_.isSound && tables_.durations.count == 1;
         if (hasSingleSamples) {
-            hasSingleSamples = Number(tables_.durations.position + 4) == 1;
+            hasSingleSamples = source_.U32(tables_.durations.begin + 4) == 1;
         }
         if (!hasSingleSamples) {
             return tables_.samples;
@@ -352,11 +267,12 @@ private:
     }
 
     // A header in packed form is looked at as what comes out of it.
-    void Unpack(ncfUInt64 position, ncfUInt64 end) {
-        const ncfUInt64 size = end - position + 8;
+    void Unpack(const StoredAtom& atom) {
+        const ncfUInt64 begin = atom.begin - 8;
+        const ncfUInt64 size = atom.end - begin;
         header_parser::HeaderBytes bytes;
         ncfUInt8* const room = size > kMostHeaderToUnpack ? nullptr : bytes.Room(size);
-        if (!room || !source_.Read(position - 8, room, static_cast<std::size_t>(size))) {
+        if (!room || !source_.Read(begin, room, size)) {
             problem_ = "the compressed movie header is too large";
             return;
         }
@@ -366,11 +282,11 @@ private:
             problem_ = verdict.reason;
             return;
         }
-        MemorySource plain(std::move(bytes));
+        header_parser::UnpackedBytes plain(std::move(bytes));
         problem_ = Walker(plain, fileLength_, true).Run();
     }
 
-    Source& source_;
+    ByteSource& source_;
     const ncfUInt64 fileLength_;
     const bool isPlain_;
     const ncfUInt64 limit_;  // of the sums
@@ -386,7 +302,7 @@ private:
 }  // namespace
 
 std::string FindImpossibleTable(const std::filesystem::path& path) {
-    FileSource file(path);
+    header_parser::FileBytes file(path);
     return Walker(file, file.Length(), false).Run();
 }
 

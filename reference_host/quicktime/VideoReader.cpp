@@ -53,20 +53,14 @@ ncfUInt32 VideoReader::GetFrameBufferSize(ncfUInt32, ncfUInt64, ncfUInt32) {
 NCFRESULT VideoReader::ReadFrame(ncfUInt64 sample, void* destination, ncfUInt32, ncfUInt32,
                                  ncfUInt32) {
     const std::lock_guard<std::mutex> lock(mutex_);
-    if (!destination) {
-        return NCF_E_POINTER;
-    }
-    const auto layout = static_cast<PixelLayout>(layout_);
-    if (!isStarted_ || layout_ == 0 || PictureBytes(layout, source_.width, source_.height) == 0) {
-        return NMA_E_NOTINITIALIZED;
-    }
-    return Guarded([&]() -> NCFRESULT {
+    return Guarded([&] {
+        Need(destination);
+        const auto layout = static_cast<PixelLayout>(layout_);
+        Need(isStarted_ && layout_ != 0 && PictureBytes(layout, source_.width, source_.height) != 0,
+             NMA_E_NOTINITIALIZED);
         if (!last_ || lastSample_ != sample) {
             std::shared_ptr<const AVFrame> frame;
-            const NCFRESULT result = pictures_->Read(static_cast<std::size_t>(sample), frame);
-            if (result < 0) {
-                return result;
-            }
+            Check(pictures_->Read(static_cast<std::size_t>(sample), frame));
             last_ = std::move(frame);
             lastSample_ = sample;
         }

@@ -3,6 +3,7 @@
 #include "reference_host/util/Factory.h"
 
 #include <mutex>
+#include <utility>
 
 namespace host::util {
 
@@ -10,7 +11,7 @@ namespace {
 
 struct Kept {
     std::mutex mutex;
-    INCFComponentFactory* factory = nullptr;
+    Ref<INCFComponentFactory> factory;
 };
 
 // Never destroyed: modules that use the library stay mapped to the end of the
@@ -20,53 +21,33 @@ Kept& TheKept() {
     return *kept;
 }
 
-INCFComponentFactory* Borrowed() {
+// In return for the one kept, which goes when nobody waits for it.
+Ref<INCFComponentFactory> Exchange(Ref<INCFComponentFactory> factory) {
     Kept& kept = TheKept();
     const std::lock_guard<std::mutex> guard(kept.mutex);
-    if (kept.factory != nullptr) {
-        kept.factory->AddRef();
-    }
+    return std::exchange(kept.factory, std::move(factory));
+}
+
+Ref<INCFComponentFactory> Borrowed() {
+    Kept& kept = TheKept();
+    const std::lock_guard<std::mutex> guard(kept.mutex);
     return kept.factory;
 }
 
 }  // namespace
 
 void KeepFactory(INCFComponentFactory* factory) {
-    if (factory != nullptr) {
-        factory->AddRef();
-    }
-    Kept& kept = TheKept();
-    INCFComponentFactory* former = nullptr;
-    {
-        const std::lock_guard<std::mutex> guard(kept.mutex);
-        former = kept.factory;
-        kept.factory = factory;
-    }
-    if (former != nullptr) {
-        former->Release();
-    }
+    Exchange(Ref<INCFComponentFactory>(factory));
 }
 
-NCFRESULT CreateHostString(INCFString** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
-    INCFComponentFactory* factory = Borrowed();
-    if (factory == nullptr) {
+NCFRESULT CreateHostString(Ref<INCFString>& out) {
+    out.Reset();
+    const Ref<INCFComponentFactory> factory = Borrowed();
+    if (!factory) {
         return NMA_E_NOTINITIALIZED;
     }
-    void* made = nullptr;
-    const NCFRESULT result =
-        factory->CreateComponent(NCFCompID_NCFString, nullptr, IID_INCFString, &made);
-    factory->Release();
-    auto* const string = static_cast<INCFString*>(made);
-    if (result >= 0) {
-        *out = string;
-    } else if (string != nullptr) {
-        string->Release();
-    }
-    return result >= 0 && made == nullptr ? NCF_E_UNEXPECTED : result;
+    const NCFRESULT result = Create(*factory, NCFCompID_NCFString, out);
+    return result >= 0 && !out ? NCF_E_UNEXPECTED : result;
 }
 
 }  // namespace host::util

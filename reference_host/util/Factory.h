@@ -4,6 +4,7 @@
 
 #include "host_interfaces/framework/ComponentFactory.h"
 #include "host_interfaces/framework/String.h"
+#include "reference_host/util/Ref.h"
 
 // The component factory that NMAInitialize was given, the library's only way
 // to the host.
@@ -13,6 +14,6 @@ namespace host::util {
 void KeepFactory(INCFComponentFactory* factory);
 
 // A new string of the host; NMA_E_NOTINITIALIZED without a factory.
-NCFRESULT CreateHostString(INCFString** out);
+NCFRESULT CreateHostString(Ref<INCFString>& out);
 
 }  // namespace host::util

@@ -4,10 +4,10 @@
 #include <memory>
 
 #include "host_interfaces/util/NMAUtil.h"
-#include "reference_host/util/DigestEngine.h"
+#include "reference_host/system/DigestEngine.h"
 #include "reference_host/util/NMAStringState.h"
 
-using host::util::DigestEngine;
+using host::system::DigestEngine;
 using host::util::Quietly;
 
 // The digest is the first half of the SHA-256 of all bytes added.
@@ -52,7 +52,7 @@ NCFRESULT GenerateUMIDFromData_Finish(void** state, GUID* uid) {
     if (engine == nullptr) {
         return NMA_E_NOTINITIALIZED;
     }
-    std::array<unsigned char, host::util::kDigestBytes> digest{};
+    std::array<unsigned char, host::system::kDigestBytes> digest{};
     if (!engine->Finish(digest)) {
         return NCF_E_FAIL;
     }

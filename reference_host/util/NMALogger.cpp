@@ -9,6 +9,8 @@
 #include <new>
 #include <string>
 
+#include "reference_host/util/text/Formatted.h"
+
 namespace {
 
 constexpr ncfUInt32 kFirstLevel = 1;
@@ -29,16 +31,8 @@ Destination& TheDestination() {
     return *destination;
 }
 
-std::string Format(const char* format, va_list arguments) {
-    va_list again;
-    va_copy(again, arguments);
-    const int length = std::vsnprintf(nullptr, 0, format, again);
-    va_end(again);
-    if (length <= 0) {
-        return {};
-    }
-    std::string line(static_cast<std::size_t>(length), '\0');
-    std::vsnprintf(line.data(), line.size() + 1, format, arguments);
+std::string Line(const char* format, va_list arguments) {
+    std::string line = host::text::Formatted(format, arguments);
     while (!line.empty() && line.back() == '\n') {
         line.pop_back();
     }
@@ -89,7 +83,7 @@ void NMALogger::Write(ncfUInt32 level, const char* format, ...) {
     va_list arguments;
     va_start(arguments, format);
     try {
-        const std::string line = Format(format, arguments);
+        const std::string line = Line(format, arguments);
         std::string name;
         {
             const std::lock_guard<std::mutex> guard(state_->mutex);

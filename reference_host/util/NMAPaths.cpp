@@ -4,12 +4,12 @@
 #include <system_error>
 
 #include "host_interfaces/util/NMAUtil.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/Factory.h"
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/HostText.h"
-#include "reference_host/util/text/Paths.h"
 
 namespace text = host::text;
 using host::util::Quietly;
@@ -18,19 +18,15 @@ namespace {
 
 // Hands `value` out as a new host string.
 NCFRESULT GiveOut(const std::u32string& value, INCFString** out) {
-    INCFString* made = nullptr;
-    NCFRESULT result = host::util::CreateHostString(&made);
+    host::Ref<INCFString> made;
+    NCFRESULT result = host::util::CreateHostString(made);
     if (result >= 0) {
-        result = text::Assign(made, value, kNCFUTF16);
+        result = text::Assign(made.get(), value, kNCFUTF16);
     }
-    if (result < 0) {
-        if (made != nullptr) {
-            made->Release();
-        }
-        return result;
+    if (result >= 0) {
+        *out = made.Detach();
     }
-    *out = made;
-    return NCF_OK;
+    return result < 0 ? result : NCF_OK;
 }
 
 bool StartsWithDrive(const std::u32string& path) {
@@ -41,7 +37,7 @@ bool StartsWithDrive(const std::u32string& path) {
 
 void UseForwardSlashes(std::u32string& path) {
     for (char32_t& c : path) {
-        c = text::IsSeparator(c) ? U'/' : c;
+        c = host::system::IsSeparator(c) ? U'/' : c;
     }
 }
 
@@ -51,7 +47,7 @@ void MakeAbsolute(std::u32string& path) {
         return;
     }
     std::error_code failure;
-    std::u32string folder = text::FromSystemPath(std::filesystem::current_path(failure));
+    std::u32string folder = host::system::FromSystemPath(std::filesystem::current_path(failure));
     UseForwardSlashes(folder);
     if (folder.empty() || folder.back() != U'/') {
         folder.push_back(U'/');
@@ -84,7 +80,7 @@ NCFRESULT UrlOf(std::u32string path, std::u32string& url) {
 
 std::u32string BareName(std::u32string path) {
     std::size_t start = path.size();
-    while (start > 0 && !text::IsSeparator(path[start - 1])) {
+    while (start > 0 && !host::system::IsSeparator(path[start - 1])) {
         --start;
     }
     path.erase(0, start);

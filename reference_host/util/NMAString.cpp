@@ -23,10 +23,7 @@ NMAString::NMAString(const char* utf8) : NMAString() {
         return;
     }
     state_->encoding = kNCFUTF8;
-    Quietly(false, [&] {
-        state_->text = text::FromUtf8(utf8 == nullptr ? "" : utf8);
-        return true;
-    });
+    Quietly([&] { state_->text = text::FromUtf8(utf8 == nullptr ? "" : utf8); });
 }
 
 NMAString::NMAString(INCFString* source, ncfUInt32 encoding) : NMAString() {
@@ -34,10 +31,7 @@ NMAString::NMAString(INCFString* source, ncfUInt32 encoding) : NMAString() {
         return;
     }
     state_->encoding = encoding <= kNCFWCHAR ? encoding : kNCFUTF16;
-    Quietly(false, [&] {
-        state_->text = text::Read(source);
-        return true;
-    });
+    Quietly([&] { state_->text = text::Read(source); });
 }
 
 NMAString::~NMAString() {
@@ -52,15 +46,14 @@ NMAString& NMAString::operator=(const NMAString& other) {
     ncfUInt32 encoding = kNCFUTF16;
     if (other.state_ != nullptr) {
         const std::lock_guard<std::mutex> guard(other.state_->mutex);
-        Quietly(false, [&] {
+        Quietly([&] {
             other.state_->LookAtShown();
             copy = other.state_->text;
-            return true;
         });
         encoding = other.state_->encoding;
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    state_->Hide();
+    state_->shown.Reset();
     state_->Take(std::move(copy));
     state_->encoding = encoding;
     return *this;
@@ -87,12 +80,11 @@ NMAString& NMAString::operator+=(const NMAString& tail) {
         return *this;
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    Quietly(false, [&] {
+    Quietly([&] {
         state_->LookAtShown();
         std::u32string joined = state_->text + copy.state_->text;
-        state_->Hide();
+        state_->shown.Reset();
         state_->Take(std::move(joined));
-        return true;
     });
     return *this;
 }
@@ -109,7 +101,13 @@ bool NMAString::IsEmpty() const {
 }
 
 NCFRESULT NMAString::CreateString(INCFString** out) {
-    return host::util::CreateHostString(out);
+    if (out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    host::Ref<INCFString> made;
+    const NCFRESULT result = host::util::CreateHostString(made);
+    *out = made.Detach();
+    return result;
 }
 
 INCFString* NMAString::InArg() const {
@@ -117,24 +115,23 @@ INCFString* NMAString::InArg() const {
         return host::util::RefusingString();
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    if (state_->shown != nullptr) {
-        return state_->shown;
+    if (state_->shown) {
+        return state_->shown.get();
     }
-    INCFString* made = nullptr;
-    if (CreateString(&made) < 0) {
+    host::Ref<INCFString> made;
+    if (host::util::CreateHostString(made) < 0) {
         return host::util::RefusingString();
     }
     const NCFRESULT filled = Quietly(NCF_E_OUTOFMEMORY, [&] {
-        const NCFRESULT result = text::Assign(made, state_->text, state_->encoding);
+        const NCFRESULT result = text::Assign(made.get(), state_->text, state_->encoding);
         // Text that has no form in the wanted encoding is shown all the same.
-        return result >= 0 ? result : text::Assign(made, state_->text, kNCFUTF16);
+        return result >= 0 ? result : text::Assign(made.get(), state_->text, kNCFUTF16);
     });
     if (filled < 0) {
-        made->Release();
         return host::util::RefusingString();
     }
-    state_->shown = made;
-    return made;
+    state_->shown = std::move(made);
+    return state_->shown.get();
 }
 
 INCFString** NMAString::OutArg() {
@@ -143,49 +140,18 @@ INCFString** NMAString::OutArg() {
         return &nowhere;
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    state_->Hide();
     state_->Take({});
-    return &state_->shown;
+    return state_->shown.Out();
 }
 
 const char* NMAString::GetUTF8String() const {
-    if (state_ == nullptr) {
-        return "";
-    }
-    const std::lock_guard<std::mutex> guard(state_->mutex);
-    return Quietly("", [&] {
-        state_->LookAtShown();
-        if (!state_->utf8) {
-            state_->utf8 = text::ToUtf8Lossy(state_->text);
-        }
-        return state_->utf8->c_str();
-    });
+    return state_ == nullptr ? "" : state_->Shown(&State::utf8, text::ToUtf8Lossy, "");
 }
 
 const ncfUTF16* NMAString::GetUTF16String() const {
-    if (state_ == nullptr) {
-        return u"";
-    }
-    const std::lock_guard<std::mutex> guard(state_->mutex);
-    return Quietly(u"", [&] {
-        state_->LookAtShown();
-        if (!state_->utf16) {
-            state_->utf16 = text::ToUtf16Lossy(state_->text);
-        }
-        return state_->utf16->c_str();
-    });
+    return state_ == nullptr ? u"" : state_->Shown(&State::utf16, text::ToUtf16Lossy, u"");
 }
 
 const wchar_t* NMAString::GetWCHARString() const {
-    if (state_ == nullptr) {
-        return L"";
-    }
-    const std::lock_guard<std::mutex> guard(state_->mutex);
-    return Quietly(L"", [&] {
-        state_->LookAtShown();
-        if (!state_->wide) {
-            state_->wide = text::ToWideLossy(state_->text);
-        }
-        return state_->wide->c_str();
-    });
+    return state_ == nullptr ? L"" : state_->Shown(&State::wide, text::ToWideLossy, L"");
 }

@@ -5,9 +5,9 @@
 #include <cstring>
 #include <cwchar>
 
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/text/Encodings.h"
-#include "reference_host/util/text/Paths.h"
 
 namespace text = host::text;
 using host::util::Quietly;
@@ -18,11 +18,10 @@ NMAString NMAStringUtils::CreateWCharNMAString(const wchar_t* characters, ncfSIn
         return made;
     }
     made.state_->encoding = kNCFWCHAR;
-    Quietly(false, [&] {
+    Quietly([&] {
         const std::size_t units =
             length == -1 ? std::wcslen(characters) : static_cast<std::size_t>(length);
         made.state_->text = text::FromWide({characters, units});
-        return true;
     });
     return made;
 }
@@ -33,7 +32,7 @@ NMAString NMAStringUtils::GetParentFolder(const NMAString& path) {
         return folder;
     }
     std::u32string& characters = folder.state_->text;
-    while (!characters.empty() && !text::IsSeparator(characters.back())) {
+    while (!characters.empty() && !host::system::IsSeparator(characters.back())) {
         characters.pop_back();
     }
     return folder;
@@ -45,11 +44,8 @@ NMAString NMAStringUtils::CombinePath(const NMAString& folder, const NMAString& 
         return path;
     }
     std::u32string& characters = path.state_->text;
-    if (!characters.empty() && !text::IsSeparator(characters.back())) {
-        Quietly(false, [&] {
-            characters.push_back(U'\\');
-            return true;
-        });
+    if (!characters.empty() && !host::system::IsSeparator(characters.back())) {
+        Quietly([&] { characters.push_back(U'\\'); });
     }
     path += name;
     return path;

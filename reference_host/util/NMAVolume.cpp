@@ -7,13 +7,13 @@
 #include <new>
 #include <vector>
 
+#include "reference_host/system/FileSystem.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/Factory.h"
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/RefusingString.h"
-#include "reference_host/util/files/FileSystem.h"
 #include "reference_host/util/files/FolderSearch.h"
 #include "reference_host/util/text/Encodings.h"
-#include "reference_host/util/text/Paths.h"
 
 namespace text = host::text;
 using host::files::FolderSearch;
@@ -33,14 +33,11 @@ struct NMAVolume::State {
             handle = nullptr;
             return nullptr;
         }
-        INCFString* made = nullptr;
+        host::Ref<INCFString> made;
         std::u32string name;
-        if ((*search)->Next(name) && host::util::CreateHostString(&made) >= 0 &&
-            text::Assign(made, name, kNCFUTF16) >= 0) {
-            return made;
-        }
-        if (made != nullptr) {
-            made->Release();
+        if ((*search)->Next(name) && host::util::CreateHostString(made) >= 0 &&
+            text::Assign(made.get(), name, kNCFUTF16) >= 0) {
+            return made.Detach();
         }
         searches.erase(search);
         handle = nullptr;
@@ -52,7 +49,7 @@ NMAVolume::NMAVolume(INCFString* folder) : state_(new (std::nothrow) State) {
     if (state_ == nullptr) {
         return;
     }
-    Quietly(false, [&] { return text::ToSystemPath(text::Read(folder), state_->folder); });
+    Quietly(false, [&] { return host::system::ToSystemPath(text::Read(folder), state_->folder); });
 }
 
 NMAVolume::~NMAVolume() {
@@ -85,28 +82,29 @@ ncfUInt32 NMAVolume::GetVolumeSerialNumber() {
         return 0;
     }
     return Quietly(ncfUInt32{0},
-                   [&] { return host::files::ReadVolumeFacts(state_->folder).serialNumber; });
+                   [&] { return host::system::ReadVolumeFacts(state_->folder).serialNumber; });
 }
 
 INCFString* NMAVolume::GetVolumeLabel() {
-    INCFString* label = nullptr;
-    if (host::util::CreateHostString(&label) < 0) {
+    host::Ref<INCFString> label;
+    if (host::util::CreateHostString(label) < 0) {
         return host::util::RefusingString();
     }
     if (state_ != nullptr) {
         Quietly(NCF_E_OUTOFMEMORY, [&] {
-            const std::u32string name = host::files::ReadVolumeFacts(state_->folder).label;
-            return text::Assign(label, name, kNCFUTF16);
+            const std::u32string name = host::system::ReadVolumeFacts(state_->folder).label;
+            return text::Assign(label.get(), name, kNCFUTF16);
         });
     }
-    return label;
+    return label.Detach();
 }
 
 ncfUInt32 NMAVolume::GetVolumeType() {
     if (state_ == nullptr) {
         return 0;
     }
-    return Quietly(ncfUInt32{0}, [&] { return host::files::ReadVolumeFacts(state_->folder).type; });
+    return Quietly(ncfUInt32{0},
+                   [&] { return host::system::ReadVolumeFacts(state_->folder).type; });
 }
 
 ncfUInt64 NMAVolume::GetModificationDate(INCFString* name) {
@@ -115,9 +113,9 @@ ncfUInt64 NMAVolume::GetModificationDate(INCFString* name) {
     }
     return Quietly(ncfUInt64{0}, [&] {
         std::filesystem::path bare;
-        if (!text::ToSystemPath(text::Read(name), bare) || bare.empty()) {
+        if (!host::system::ToSystemPath(text::Read(name), bare) || bare.empty()) {
             return ncfUInt64{0};
         }
-        return ncfUInt64{host::files::LastWrite(state_->folder / bare)};
+        return ncfUInt64{host::system::LastWrite(state_->folder / bare)};
     });
 }

@@ -10,16 +10,18 @@
 
 namespace host {
 
-// Receives what an EventReader meets. Texts are UTF-8 and valid for the call
-// only. A negative result ends the reading; a thrown one does the same.
+// Receives what an EventReader meets; what is not overridden is passed over. Texts are UTF-8 and
+// valid for the call only. A negative result ends the reading; a thrown one does the same.
 class XmlEvents {
 public:
     virtual ~XmlEvents() = default;
     // `attributes` are names and values by turns, closed by a null.
-    virtual NCFRESULT OnElement(const char* name, const char** attributes) = 0;
+    virtual NCFRESULT OnElement(const char* /*name*/, const char** /*attributes*/) {
+        return NCF_OK;
+    }
     // A whole run of text between two marks, white space included. Entities,
     // CDATA sections and the ends of buffers don't split it; comments do.
-    virtual NCFRESULT OnText(std::string_view text) = 0;
+    virtual NCFRESULT OnText(std::string_view /*text*/) { return NCF_OK; }
 };
 
 // Checks a document that comes in pieces, and tells of it. Anything that is

@@ -52,9 +52,7 @@ NCFRESULT SaxParser::SetErrorHandler(UTIL::INCFSaxErrorHandler* handler) {
 NCFRESULT SaxParser::Parse(ncfUInt32 zero, INCFString* path) {
     return Guarded([&]() -> NCFRESULT {
         lastMessage_.clear();
-        if (zero != 0) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(zero == 0, NCF_E_INVALIDARG);
         return path == nullptr ? NCF_E_POINTER : ParseFile(path);
     });
 }

@@ -6,7 +6,7 @@
 
 #include "host_interfaces/xml/SaxParser.h"
 #include "reference_host/framework/Component.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 namespace host {
 

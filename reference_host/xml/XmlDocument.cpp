@@ -16,22 +16,17 @@ NCFRESULT XmlDocument::Load(INCFString* path) {
     tree_.reset();
     return Guarded([&]() -> NCFRESULT {
         std::filesystem::path file;
-        NCFRESULT result = PathFrom(path, file);
-        if (result < 0) {
-            return result;
-        }
+        Check(PathFrom(path, file));
         std::string bytes;
         std::string problem;
-        result = ReadInputFile(
+        Check(ReadInputFile(
             file,
             [&](const char* piece, std::size_t size, bool) {
                 bytes.append(piece, size);
                 return NCF_OK;
             },
-            problem);
-        if (result < 0) {
-            return result;
-        }
+            problem));
+        NCFRESULT result = NCF_OK;
         tree_ = XmlTree::Load(bytes, nullptr, result);
         return result;
     });
@@ -40,16 +35,10 @@ NCFRESULT XmlDocument::Load(INCFString* path) {
 NCFRESULT XmlDocument::LoadFromText(INCFString* text) {
     tree_.reset();
     return Guarded([&]() -> NCFRESULT {
-        if (text == nullptr) {
-            return NCF_E_POINTER;
-        }
+        Need(text);
         std::string bytes;
-        if (!text::ToUtf8(text::Read(text), bytes)) {
-            return NCF_E_FAIL;
-        }
-        if (bytes.size() > XmlLimits::kLargestDocument) {
-            return NCF_E_NOTSUPPORTED;
-        }
+        Need(text::ToUtf8(text::Read(text), bytes), NCF_E_FAIL);
+        Need(bytes.size() <= XmlLimits::kLargestDocument, NCF_E_NOTSUPPORTED);
         NCFRESULT result = NCF_OK;
         tree_ = XmlTree::Load(bytes, "UTF-8", result);
         return result;
@@ -57,14 +46,10 @@ NCFRESULT XmlDocument::LoadFromText(INCFString* text) {
 }
 
 NCFRESULT XmlDocument::GetRootNode(INCFUnknown** out) {
-    if (out == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *out = nullptr;
-    if (tree_ == nullptr) {
-        return NMA_E_NOTINITIALIZED;
-    }
     return Guarded([&] {
+        Need(out);
+        *out = nullptr;
+        Need(tree_, NMA_E_NOTINITIALIZED);
         *out = tree_->ObjectFor(tree_->root()).Detach();
         return NCF_OK;
     });

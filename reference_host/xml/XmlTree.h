@@ -9,7 +9,7 @@
 #include <unordered_map>
 
 #include "host_interfaces/xml/XmlDocument.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 namespace host {
 

@@ -80,10 +80,7 @@ XmlWriter::~XmlWriter() = default;
 NCFRESULT XmlWriter::Open(INCFString* path) {
     return Guarded([&] {
         std::filesystem::path file;
-        const NCFRESULT named = path == nullptr ? NCF_OK : PathFrom(path, file);
-        if (named < 0) {
-            return named;
-        }
+        Check(path == nullptr ? NCF_OK : PathFrom(path, file));
         tree_ = std::make_unique<Tree>();
         file_ = std::move(file);
         isClosed_ = false;
@@ -93,12 +90,8 @@ NCFRESULT XmlWriter::Open(INCFString* path) {
 
 NCFRESULT XmlWriter::Close() {
     return Guarded([&] {
-        if (tree_ == nullptr || isClosed_) {
-            return NMA_E_NOTINITIALIZED;
-        }
-        if (!tree_->document.document_element()) {
-            return NMA_E_NODATA;
-        }
+        Need(tree_ && !isClosed_, NMA_E_NOTINITIALIZED);
+        Need(tree_->document.document_element(), NMA_E_NODATA);
         isClosed_ = true;
         if (file_.empty()) {
             return NCF_OK;
@@ -112,39 +105,25 @@ NCFRESULT XmlWriter::Close() {
 }
 
 NCFRESULT XmlWriter::GetText(INCFString** text) {
-    if (text == nullptr) {
-        return NCF_E_POINTER;
-    }
-    *text = nullptr;
     return Guarded([&] {
-        if (tree_ == nullptr) {
-            return NMA_E_NOTINITIALIZED;
-        }
+        Need(text);
+        *text = nullptr;
+        Need(tree_, NMA_E_NOTINITIALIZED);
         return GiveString(tree_->Print(), text);
     });
 }
 
 NCFRESULT XmlWriter::Attribute(INCFString* element, INCFString* name, INCFString* value) {
     return Guarded([&] {
-        if (tree_ == nullptr || isClosed_) {
-            return NMA_E_NOTINITIALIZED;
-        }
+        Need(tree_ && !isClosed_, NMA_E_NOTINITIALIZED);
         std::string key;
         std::string content;
-        if (!ReadName(name, key) || !ReadContent(value, content)) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(ReadName(name, key) && ReadContent(value, content), NCF_E_INVALIDARG);
         int depth = 0;
         pugi::xml_node node = tree_->Nearest(text::ReadUtf8(element), depth);
-        if (!node) {
-            return NCF_E_INVALIDARG;
-        }
-        if (node.first_child()) {
-            return NCF_E_FAIL;
-        }
-        if (node.attribute(key.c_str())) {
-            return NMA_E_ALREADYSET;
-        }
+        Need(node, NCF_E_INVALIDARG);
+        Need(!node.first_child(), NCF_E_FAIL);
+        Need(!(node.attribute(key.c_str())), NMA_E_ALREADYSET);
         const bool made = node.append_attribute(key.c_str()).set_value(content.c_str());
         return made ? NCF_OK : NCF_E_OUTOFMEMORY;
     });
@@ -152,13 +131,9 @@ NCFRESULT XmlWriter::Attribute(INCFString* element, INCFString* name, INCFString
 
 NCFRESULT XmlWriter::Element(INCFString* name, INCFString* parent) {
     return Guarded([&] {
-        if (tree_ == nullptr || isClosed_) {
-            return NMA_E_NOTINITIALIZED;
-        }
+        Need(tree_ && !isClosed_, NMA_E_NOTINITIALIZED);
         std::string tag;
-        if (!ReadName(name, tag)) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(ReadName(name, tag), NCF_E_INVALIDARG);
         int depth = 0;
         pugi::xml_node place = tree_->document;
         if (parent != nullptr) {
@@ -166,17 +141,11 @@ NCFRESULT XmlWriter::Element(INCFString* name, INCFString* parent) {
         } else if (tree_->document.document_element()) {
             return NMA_E_ROOTEXISTS;
         }
-        if (!place) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(place, NCF_E_INVALIDARG);
         // What is written must be readable again.
-        if (depth >= XmlLimits::kDeepest) {
-            return NCF_E_NOTSUPPORTED;
-        }
+        Need(depth < XmlLimits::kDeepest, NCF_E_NOTSUPPORTED);
         pugi::xml_node made = place.append_child(tag.c_str());
-        if (!made) {
-            return NCF_E_OUTOFMEMORY;
-        }
+        Need(made, NCF_E_OUTOFMEMORY);
         tree_->open = made;
         tree_->depth = depth + 1;
         return NCF_OK;
@@ -185,22 +154,14 @@ NCFRESULT XmlWriter::Element(INCFString* name, INCFString* parent) {
 
 NCFRESULT XmlWriter::Text(INCFString* text, INCFString* parent) {
     return Guarded([&] {
-        if (tree_ == nullptr || isClosed_) {
-            return NMA_E_NOTINITIALIZED;
-        }
+        Need(tree_ && !isClosed_, NMA_E_NOTINITIALIZED);
         std::string content;
-        if (text == nullptr || !ReadContent(text, content)) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(text && ReadContent(text, content), NCF_E_INVALIDARG);
         int depth = 0;
         pugi::xml_node node = tree_->Nearest(text::ReadUtf8(parent), depth);
-        if (!node) {
-            return NCF_E_INVALIDARG;
-        }
+        Need(node, NCF_E_INVALIDARG);
         const bool made = node.append_child(pugi::node_pcdata).set_value(content.c_str());
-        if (!made) {
-            return NCF_E_OUTOFMEMORY;
-        }
+        Need(made, NCF_E_OUTOFMEMORY);
         tree_->open = node;
         tree_->depth = depth;
         return NCF_OK;

@@ -9,6 +9,7 @@
 
 #include "source/aaf/NewAAFFromMovie.h"
 
+#include "host_interfaces/Version.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/aaf/AAFDefs.h"
 #include "source/aaf/AAFGuard.h"
@@ -52,9 +53,9 @@ struct Description : ClipDescription {
 NCFRESULT Description::OpenFile() {
     aafCharacter companyName[] = L"Cliphost";
     aafCharacter productName[] = L"QuickTime Plug-In";
-    aafCharacter productVersionString[] = L"1.3.2";
+    aafCharacter productVersionString[] = L"" PRODUCT_VERSION_TEXT;
     aafCharacter platform[] = L"Win64";
-    aafProductVersion_t productVersion = {1, 3, 2, 6720, kAAFVersionUnknown};
+    aafProductVersion_t productVersion = {PRODUCT_VERSION_NUMBERS, 6720, kAAFVersionUnknown};
     aafProductIdentification_t productID = {
         companyName, productName, productVersionString,
         ncfGuid("781F84B7-B989-4534-8A07-C595CB9A6FB8"), platform, &productVersion};

@@ -11,7 +11,7 @@
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Describe.h"
-#include "reference_host/cliphost/MovieDiagnosis.h"
+#include "reference_host/cliphost/RouteTaken.h"
 #include "tests/system/Facts.h"
 #include "tests/system/SystemTest.h"
 

@@ -37,7 +37,7 @@ protected:
     std::string Described(const std::filesystem::path& movie) {
         host::Ref<NMA::IMediaContainer3> container;
         host::Ref<NMA::IAAFClips> clips;
-        cliphost::AafRef<IAAFFile> file;
+        host::Ref<IAAFFile> file;
         const auto path = cliphost::PathForModule(movie);
         const bool described =
             session().host().Create(NMA::CompID_QuickTimeContainer, container) >= 0 &&

@@ -4,8 +4,8 @@
 
 #include <system_error>
 
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/files/NamePattern.h"
-#include "reference_host/util/text/Paths.h"
 
 namespace host::files {
 
@@ -25,7 +25,7 @@ bool FolderSearch::Next(std::u32string& name) {
         // Pipes and devices are left out as folders are: opening one could wait
         // for ever.
         const bool isFile = entry_->is_regular_file(failure) && !failure;
-        std::u32string candidate = text::FromSystemPath(entry_->path().filename());
+        std::u32string candidate = host::system::FromSystemPath(entry_->path().filename());
         entry_.increment(failure);
         if (failure) {
             entry_ = {};

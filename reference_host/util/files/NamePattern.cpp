@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/util/files/NamePattern.h"
 
-#include "reference_host/util/files/FileSystem.h"
+#include "reference_host/system/FileSystem.h"
 
 namespace host::files {
 
@@ -18,7 +18,8 @@ bool MatchesPattern(std::u32string_view name, std::u32string_view pattern) {
             star = p++;
             takenByStar = n;
         } else if (p < pattern.size() &&
-                   (pattern[p] == U'?' || NameCharacter(pattern[p]) == NameCharacter(name[n]))) {
+                   (pattern[p] == U'?' || host::system::NameCharacter(pattern[p]) ==
+                                              host::system::NameCharacter(name[n]))) {
             ++n;
             ++p;
         } else if (star != std::u32string_view::npos) {

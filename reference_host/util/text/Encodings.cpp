@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/util/text/Encodings.h"
 
+#include <algorithm>
+
 namespace host::text {
 
 namespace {
@@ -9,10 +11,6 @@ namespace {
 constexpr char32_t kReplacement = 0xFFFD;
 constexpr char32_t kLastCharacter = 0x10FFFF;
 constexpr char32_t kCarriedByte = 0xDC00;
-
-bool IsSurrogate(char32_t c) {
-    return c >= 0xD800 && c <= 0xDFFF;
-}
 
 bool IsCarriedByte(char32_t c) {
     return c >= kCarriedByte + 0x80 && c <= kCarriedByte + 0xFF;
@@ -169,6 +167,14 @@ Text EncodeLossy(std::u32string_view text, Append append) {
 }
 
 }  // namespace
+
+bool IsSurrogate(char32_t c) {
+    return c >= 0xD800 && c <= 0xDFFF;
+}
+
+bool HoldsSurrogate(std::u32string_view text) {
+    return std::any_of(text.begin(), text.end(), IsSurrogate);
+}
 
 std::u32string FromUtf8(std::string_view text) {
     std::u32string out;

@@ -14,6 +14,9 @@
 // between the wide encodings unchanged but have no place in UTF-8.
 namespace host::text {
 
+bool IsSurrogate(char32_t c);
+bool HoldsSurrogate(std::u32string_view text);
+
 std::u32string FromUtf8(std::string_view text);
 std::u32string FromUtf16(std::u16string_view text);
 std::u32string FromWide(std::wstring_view text);

@@ -19,10 +19,6 @@ constexpr Range kControls[] = {
     {0x2066, 0x2069},                    // isolated directions
 };
 
-bool IsSurrogate(char32_t c) {
-    return c >= 0xD800 && c <= 0xDFFF;
-}
-
 void AppendEscaped(char32_t c, std::string& out) {
     static constexpr char kDigits[] = "0123456789ABCDEF";
     switch (c) {

@@ -4,8 +4,8 @@
 // Clips over made movies, read with the host's own header parser.
 
 #include "reference_host/framework/ObjectCount.h"
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/util/Ref.h"
 #include "reference_host/xml/XmlDocument.h"
 #include "source/clips/LoadMedia.h"
 #include "tests/support/TestFolder.h"

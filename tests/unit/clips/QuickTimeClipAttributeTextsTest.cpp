@@ -5,7 +5,7 @@
 // with the host's own XML component.
 
 #include "host_interfaces/xml/XmlDocument.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 #include "reference_host/xml/XmlDocument.h"
 #include "tests/unit/clips/ClipFixture.h"
 

@@ -9,7 +9,7 @@
 #include <fstream>
 
 #include "host_interfaces/util/NMAUtil.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 #include "reference_host/xml/SaxParser.h"
 #include "source/descriptor_data/GenericDocHandler.h"
 #include "source/descriptor_data/IGenericDocHandler.h"

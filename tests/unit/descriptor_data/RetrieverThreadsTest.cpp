@@ -10,7 +10,7 @@
 
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/framework/Host.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
 #include "source/descriptor_data/GenericDocHandler.h"
 #include "source/descriptor_data/IGenericDocHandler.h"

@@ -6,7 +6,7 @@
 
 #include <algorithm>
 
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 using host::Buffer;
 using host::MakeRef;

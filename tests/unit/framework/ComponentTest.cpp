@@ -7,8 +7,8 @@
 #include <thread>
 #include <vector>
 
-#include "reference_host/framework/Ref.h"
 #include "reference_host/framework/Settings.h"
+#include "reference_host/util/Ref.h"
 
 using host::MakeRef;
 using host::Ref;

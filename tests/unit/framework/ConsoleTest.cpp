@@ -8,7 +8,7 @@
 #include <thread>
 #include <vector>
 
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 using host::Console;
 using host::MakeRef;

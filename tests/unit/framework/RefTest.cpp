@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 #include <gtest/gtest.h>
 

@@ -5,7 +5,7 @@
 #include <gtest/gtest.h>
 
 #include "reference_host/framework/Capability.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 using host::MakeRef;
 using host::Settings;

@@ -18,8 +18,8 @@
 #include <string>
 #include <vector>
 
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/util/Ref.h"
 #include "tests/support/Quoted.h"
 
 namespace {

@@ -4,8 +4,8 @@
 
 #include <string>
 
-#include "reference_host/framework/Ref.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/util/Ref.h"
 #include "tests/support/movies/Movie.h"
 
 // A movie that went through the parser, asked through its interfaces alone.

@@ -6,7 +6,7 @@
 #include <cstdio>
 #include <cstdlib>
 
-#include "reference_host/framework/Ref.h"
+#include "reference_host/util/Ref.h"
 
 namespace {
 

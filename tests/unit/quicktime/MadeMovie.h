@@ -8,7 +8,8 @@
 #include <vector>
 
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
-#include "reference_host/framework/Ref.h"
+#include "reference_host/header_parser/ByteReader.h"
+#include "reference_host/util/Ref.h"
 #include "tests/support/TestFolder.h"
 
 namespace quicktime_tests {
@@ -52,12 +53,7 @@ Bytes AllPictures(QTWrapper::IQTVideoReader& reader, ncfUInt64* count = nullptr)
 // Signal to noise in decibels, of numbers of 8 bits; infinite when equal.
 double Psnr(const Bytes& a, const Bytes& b);
 
-constexpr ncfUInt32 Code(const char (&text)[5]) {
-    return static_cast<ncfUInt32>(static_cast<unsigned char>(text[0])) << 24 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[1])) << 16 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[2])) << 8 |
-           static_cast<ncfUInt32>(static_cast<unsigned char>(text[3]));
-}
+using header_parser::Code;
 
 }  // namespace quicktime_tests
 

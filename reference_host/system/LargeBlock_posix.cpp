@@ -4,9 +4,9 @@
 
 #include <cstdint>
 
-#include "reference_host/header_parser/LargeBlock.h"
+#include "reference_host/system/LargeBlock.h"
 
-namespace header_parser {
+namespace host::system {
 
 void ExpectLargeBlock(ncfUInt8* memory, ncfUInt64 bytes) {
     constexpr std::uintptr_t kLargePage = std::uintptr_t{2} << 20;
@@ -18,4 +18,4 @@ void ExpectLargeBlock(ncfUInt8* memory, ncfUInt64 bytes) {
     }
 }
 
-}  // namespace header_parser
+}  // namespace host::system

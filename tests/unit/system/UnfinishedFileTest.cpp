@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/cliphost/UnfinishedFile.h"
+#include "reference_host/system/UnfinishedFile.h"
 
 #include <gtest/gtest.h>
 
@@ -12,7 +12,7 @@
 #include "tests/unit/cliphost/TestFolder.h"
 
 using cliphost::OutputFile;
-using cliphost::UnfinishedFile;
+using host::system::UnfinishedFile;
 using namespace cliphost_tests;
 
 TEST(UnfinishedFile, TakesItsPlaceWhenAsked) {

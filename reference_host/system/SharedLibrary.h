@@ -5,7 +5,7 @@
 #include <filesystem>
 #include <string>
 
-namespace host {
+namespace host::system {
 
 // A shared library mapped into the process: one body for each system.
 class SharedLibrary {
@@ -31,4 +31,4 @@ private:
     void* handle_ = nullptr;
 };
 
-}  // namespace host
+}  // namespace host::system

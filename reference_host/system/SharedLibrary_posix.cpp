@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include <dlfcn.h>
 
-#include "reference_host/framework/SharedLibrary.h"
+#include "reference_host/system/SharedLibrary.h"
 
-namespace host {
+namespace host::system {
 
 SharedLibrary::~SharedLibrary() {
     Close();
@@ -42,4 +42,4 @@ bool SharedLibrary::IsFoundAs(const char* name) const {
     return handle_ != nullptr && found == handle_;
 }
 
-}  // namespace host
+}  // namespace host::system

@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/util/files/FileSystem.h"
+#include "reference_host/system/FileSystem.h"
 
 #include <windows.h>
 
@@ -9,7 +9,7 @@
 
 #include "reference_host/util/text/Encodings.h"
 
-namespace host::files {
+namespace host::system {
 
 namespace {
 
@@ -67,4 +67,4 @@ char32_t NameCharacter(char32_t c) {
     return c <= 0xFFFF ? static_cast<char32_t>(std::towlower(static_cast<wint_t>(c))) : c;
 }
 
-}  // namespace host::files
+}  // namespace host::system

@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/util/files/FileSystem.h"
+#include "reference_host/system/FileSystem.h"
 
 #include <sys/stat.h>
 #include <sys/statfs.h>
@@ -13,7 +13,7 @@
 
 #include "reference_host/util/text/Encodings.h"
 
-namespace host::files {
+namespace host::system {
 
 namespace {
 
@@ -110,4 +110,4 @@ char32_t NameCharacter(char32_t c) {
     return c;
 }
 
-}  // namespace host::files
+}  // namespace host::system

@@ -1,7 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-#include "reference_host/cliphost/AafRef.h"
+#include "reference_host/cliphost/AafQuery.h"
 
 #include <gtest/gtest.h>
 
@@ -22,7 +22,7 @@ public:
     ULONG Release() override { return --references; }
 };
 
-TEST(AafRef, HoldsWhatAQueryGave) {
+TEST(AafQuery, HoldsWhatAQueryGave) {
     Answering object;
     {
         const auto found = cliphost::As<IUnknown>(&object);
@@ -32,7 +32,7 @@ TEST(AafRef, HoldsWhatAQueryGave) {
     EXPECT_EQ(object.references, 1u);
 }
 
-TEST(AafRef, ReleasesWhatAFailedQueryLeft) {
+TEST(AafQuery, ReleasesWhatAFailedQueryLeft) {
     Answering object;
     object.result = -1;
     EXPECT_FALSE(cliphost::As<IUnknown>(&object));

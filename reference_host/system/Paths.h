@@ -9,7 +9,7 @@
 // Paths between the form that the module keeps, with backslashes, and the form
 // that the system's calls take. The one place where either is turned; every
 // part of the host that is given a path passes here.
-namespace host::text {
+namespace host::system {
 
 bool IsSeparator(char32_t c);
 
@@ -28,4 +28,4 @@ std::u32string ToModulePath(const std::filesystem::path& path);
 // can't name it. Never on Windows.
 bool HoldsBackslash(const std::filesystem::path& path);
 
-}  // namespace host::text
+}  // namespace host::system

@@ -1,13 +1,13 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/util/DigestEngine.h"
+#include "reference_host/system/DigestEngine.h"
 
 // The second needs the first.
 #include <windows.h>
 
 #include <bcrypt.h>
 
-namespace host::util {
+namespace host::system {
 
 struct DigestEngine::Handle {
     BCRYPT_ALG_HANDLE algorithm = nullptr;
@@ -47,4 +47,4 @@ bool DigestEngine::Finish(std::array<unsigned char, kDigestBytes>& digest) {
            0;
 }
 
-}  // namespace host::util
+}  // namespace host::system

@@ -6,11 +6,11 @@
 #include <filesystem>
 #include <string>
 
-// What the utility library asks of the operating system: one body for each.
-// A third one has to say how names compare, what a volume is called, and when
+// What the utility library asks of the file system: one body for each. A
+// third one has to say how names compare, what a volume is called, and when
 // a file was written last; a question that the system can't answer gives 0 or
 // an empty text, never a failure.
-namespace host::files {
+namespace host::system {
 
 struct VolumeFacts {
     std::uint32_t serialNumber = 0;
@@ -28,4 +28,4 @@ std::uint64_t LastWrite(const std::filesystem::path& file);
 // names that differ in case only are one name.
 char32_t NameCharacter(char32_t c);
 
-}  // namespace host::files
+}  // namespace host::system

@@ -5,7 +5,7 @@
 #include <filesystem>
 #include <system_error>
 
-namespace cliphost {
+namespace host::system {
 
 // The temporary name in the same folder under which a file is written. A link stays
 // a link: the file that it points to is replaced.
@@ -28,4 +28,4 @@ private:
     int slot_ = -1;  // where the signal handler finds the name
 };
 
-}  // namespace cliphost
+}  // namespace host::system

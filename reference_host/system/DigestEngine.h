@@ -8,7 +8,7 @@
 
 // SHA-256 by the system's own means: one body for each platform, all with the
 // same digest.
-namespace host::util {
+namespace host::system {
 
 inline constexpr std::size_t kDigestBytes = 32;
 
@@ -28,4 +28,4 @@ private:
     std::unique_ptr<Handle> handle_;
 };
 
-}  // namespace host::util
+}  // namespace host::system

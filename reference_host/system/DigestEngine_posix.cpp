@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include <openssl/evp.h>
 
-#include "reference_host/util/DigestEngine.h"
+#include "reference_host/system/DigestEngine.h"
 
-namespace host::util {
+namespace host::system {
 
 struct DigestEngine::Handle {
     EVP_MD_CTX* context = nullptr;
@@ -35,4 +35,4 @@ bool DigestEngine::Finish(std::array<unsigned char, kDigestBytes>& digest) {
     return EVP_DigestFinal_ex(handle_->context, digest.data(), nullptr) == 1;
 }
 
-}  // namespace host::util
+}  // namespace host::system

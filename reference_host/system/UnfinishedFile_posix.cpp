@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/cliphost/UnfinishedFile.h"
+#include "reference_host/system/UnfinishedFile.h"
 
 #include <fmt/format.h>
 #include <unistd.h>
@@ -12,7 +12,7 @@
 #include <functional>
 #include <string>
 
-namespace cliphost {
+namespace host::system {
 namespace {
 
 // A signal handler may use neither the heap nor a lock, so the names are in static
@@ -109,4 +109,4 @@ void UnfinishedFile::TakePlace(std::error_code& error) {
     }
 }
 
-}  // namespace cliphost
+}  // namespace host::system

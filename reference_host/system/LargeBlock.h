@@ -4,11 +4,11 @@
 
 #include "host_interfaces/framework/Types.h"
 
-namespace header_parser {
+namespace host::system {
 
 // Tells the system that `bytes` at `memory`, not yet touched, are one large
 // block, so that it may back them with large pages: page by page, a block of a
 // hundred megabytes costs more to touch than to parse. Only a hint.
 void ExpectLargeBlock(ncfUInt8* memory, ncfUInt64 bytes);
 
-}  // namespace header_parser
+}  // namespace host::system

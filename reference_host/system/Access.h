@@ -1,0 +1,23 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+
+namespace host::system {
+
+// What the system lets this process do with a file or folder. Errors are the
+// system's numbers; 0: none.
+
+enum class Right { Read, Write, Search };
+int AccessError(const std::filesystem::path& path, Right right);
+
+// What comes of reading a file's first byte.
+struct FirstByte {
+    int openError = 0;
+    int readError = 0;
+    bool isThere = false;
+};
+FirstByte ReadFirstByte(const std::filesystem::path& file);
+
+}  // namespace host::system

@@ -1,0 +1,20 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+
+namespace host::system {
+
+// What a program settles with the system before it does anything else: standard
+// streams that the caller closed stay closed, and a file that outgrows its limit
+// fails to be written.
+void PrepareProcess();
+
+// The file that runs. `name` is what the caller called it.
+std::filesystem::path ProgramFile(const char* name);
+
+// Whether standard error is read at a terminal.
+bool IsWatched();
+
+}  // namespace host::system

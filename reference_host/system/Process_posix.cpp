@@ -1,0 +1,36 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <csignal>
+#include <system_error>
+
+#include "reference_host/system/Process.h"
+
+namespace host::system {
+
+void PrepareProcess() {
+    // The signal would end us.
+    std::signal(SIGXFSZ, SIG_IGN);
+    // A stream that the caller closed would give its number to the next file that is
+    // opened, and what is printed would go into that file.
+    for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
+        if (fcntl(stream, F_GETFD) < 0) {
+            // Only errors may be lost; to write results there has to fail.
+            open("/dev/null", stream == STDERR_FILENO ? O_WRONLY : O_RDONLY);
+        }
+    }
+}
+
+std::filesystem::path ProgramFile(const char* name) {
+    std::error_code error;
+    const std::filesystem::path program = std::filesystem::read_symlink("/proc/self/exe", error);
+    return error ? std::filesystem::absolute(name) : program;
+}
+
+bool IsWatched() {
+    return isatty(STDERR_FILENO) != 0;
+}
+
+}  // namespace host::system

@@ -1,0 +1,24 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <system_error>
+
+namespace host::system {
+
+// A folder of our own among the temporary files, gone with what is in it.
+class ScratchFolder {
+public:
+    explicit ScratchFolder(std::error_code& error);
+    ~ScratchFolder();
+    ScratchFolder(const ScratchFolder&) = delete;
+    ScratchFolder& operator=(const ScratchFolder&) = delete;
+
+    const std::filesystem::path& path() const { return path_; }
+
+private:
+    std::filesystem::path path_;  // empty where none could be made
+};
+
+}  // namespace host::system

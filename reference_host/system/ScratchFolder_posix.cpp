@@ -1,0 +1,26 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/system/ScratchFolder.h"
+
+#include <cerrno>
+#include <cstdlib>
+
+namespace host::system {
+
+ScratchFolder::ScratchFolder(std::error_code& error) {
+    std::string name = std::filesystem::temp_directory_path() / "cliphost-XXXXXX";
+    if (mkdtemp(name.data()) == nullptr) {
+        error.assign(errno, std::generic_category());
+        return;
+    }
+    path_ = name;
+}
+
+ScratchFolder::~ScratchFolder() {
+    std::error_code ignored;
+    if (!path_.empty()) {
+        std::filesystem::remove_all(path_, ignored);
+    }
+}
+
+}  // namespace host::system
