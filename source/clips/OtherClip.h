@@ -85,7 +85,7 @@ private:
     static constexpr ncfUInt32 kMostTracks = 65535;
 
     ncfUInt32 HighestTrack() const;
-    ncfUInt32 CountTracks(TrackTest test) const;
+    NCFRESULT CountTracks(const char* ncfFunction, TrackTest test, ncfUInt32* trackCount) const;
     // Number of the `index`th track that passes the test; false past the end,
     // with `qtTrack` untouched.
     bool FindTrack(TrackTest test, ncfUInt32 index, ncfUInt32& qtTrack) const;

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The object: creation, the queries with what each prepares, and the
-// operations that start and stop the picture reader or do nothing.
+// operations that start and stop the picture reader.
 
 #include "source/essence/QuickTimeSampleMapping.h"
 
@@ -165,30 +165,6 @@ NCFRESULT QuickTimeSampleMapping::Setup(ncfUInt32 trackNMA) {
 
 NCFRESULT QuickTimeSampleMapping::Cleanup(ncfUInt32 trackNMA) {
     return InterfaceEntry([&] { return SetupOrCleanup(trackNMA, false); });
-}
-
-// --- refused, and nothing to do -----------------------------------------------------------
-
-NCFRESULT QuickTimeSampleMapping::ProviderUnsupportedOperation(ncfUInt32, ncfUInt64, ncfUInt64) {
-    return NCF_E_NOTIMPL;
-}
-NCFRESULT QuickTimeSampleMapping::ProviderNoOperationA(ncfUInt32, ncfUInt64, ncfUInt64) {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::ProviderNoOperationB() {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::ImageProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) {
-    return NCF_E_NOTIMPL;
-}
-NCFRESULT QuickTimeSampleMapping::ImageProviderNoOperationA(ncfUInt32, ncfUInt32) {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::ImageProviderNoOperationB(ncfUInt32, float) {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::AudioProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) {
-    return NCF_E_NOTIMPL;
 }
 
 }  // namespace NMA::Impl
