@@ -95,6 +95,8 @@ private:
     // Both size and ratio, in one answer of the wrapper; nothing without a
     // picture, which `hasPicture` tells.
     NCFRESULT ReadMovieBox(const char* function, bool& hasPicture);
+    // For the operation that logs.
+    NCFRESULT SettleOnce(const char* ncfFunction, const EditorSettings& editorSettings);
     NCFRESULT SetEditRateAndLengthImpl(const EditorSettings& editorSettings);
     // Whether tracks of either kind disagree with the movie's length.
     NCFRESULT FindDurationIssues(const char* function, ncfBool& sound, ncfBool& picture);

@@ -15,22 +15,19 @@ NCFRESULT OtherClip::GetMovieLength(ncfUInt64* movieLength) const {
     return GetMovieLengthBase(movieLength);
 }
 
-NCFRESULT OtherClip::SetEditRateImpl(const EditorSettings& editorSettings) {
-    NCF_FUNCTION("OtherClip::SetEditRateImpl");
-    if (length_ != 0) {
-        return NCF_OK;
+NCFRESULT OtherClip::SettleOnce(const char* ncfFunction, const EditorSettings& editorSettings) {
+    if (length_ == 0) {
+        NCF_RETURN(SetEditRateAndLengthImpl(editorSettings));
     }
-    NCF_RETURN(SetEditRateAndLengthImpl(editorSettings));
     return NCF_OK;
 }
 
+NCFRESULT OtherClip::SetEditRateImpl(const EditorSettings& editorSettings) {
+    return SettleOnce("OtherClip::SetEditRateImpl", editorSettings);
+}
+
 NCFRESULT OtherClip::SetMovieLengthImpl(const EditorSettings& editorSettings) {
-    NCF_FUNCTION("OtherClip::SetMovieLengthImpl");
-    if (length_ != 0) {
-        return NCF_OK;
-    }
-    NCF_RETURN(SetEditRateAndLengthImpl(editorSettings));
-    return NCF_OK;
+    return SettleOnce("OtherClip::SetMovieLengthImpl", editorSettings);
 }
 
 // The lengths of the single tracks are asked for since the wrapper wants the
