@@ -33,8 +33,10 @@ public:
     NCFRESULT GetTimeCodeTrackMetadata(ncfUInt32 qtTrack, TimeCodeTrackMetadata* tcInfo) override;
     NCFRESULT GetAudioTrackMetadata(ncfUInt32 qtTrack, AudioTrackMetadata* audioInfo) override;
     NCFRESULT IsAudioLPCM(ncfUInt32 qtTrack, ncfBool* isLPCM) override;
-    NCFRESULT GetEditRate(Rational* editRate) const override;
-    NCFRESULT GetMovieLength(ncfUInt64* movieLength) const override;
+    NCFRESULT GetEditRate(Rational* editRate) const override { return GetEditRateBase(editRate); }
+    NCFRESULT GetMovieLength(ncfUInt64* movieLength) const override {
+        return GetMovieLengthBase(movieLength);
+    }
     NCFRESULT GetCreationTime(ncfUInt64* creationTime) override;
     NCFRESULT GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) override;
     NCFRESULT GetContentForHash(std::vector<ncfUInt8>& pContent) override;
@@ -64,8 +66,12 @@ public:
     NCFRESULT SetColorSpaceImpl() override;
     NCFRESULT SetGeometryImpl() override;
     // Rate and length are settled together by whichever comes first, once.
-    NCFRESULT SetEditRateImpl(const EditorSettings& editorSettings) override;
-    NCFRESULT SetMovieLengthImpl(const EditorSettings& editorSettings) override;
+    NCFRESULT SetEditRateImpl(const EditorSettings& editorSettings) override {
+        return SettleOnce("OtherClip::SetEditRateImpl", editorSettings);
+    }
+    NCFRESULT SetMovieLengthImpl(const EditorSettings& editorSettings) override {
+        return SettleOnce("OtherClip::SetMovieLengthImpl", editorSettings);
+    }
     NCFRESULT GetEncodedWidthAndHeightImpl(ncfUInt32* width, ncfUInt32* height) override;
     NCFRESULT GetImageAspectRatioImpl(ncfUInt32* numerator, ncfUInt32* denominator) override;
     NCFRESULT GetTimeCodeTrackCountImpl(ncfUInt32* trackCount) override;

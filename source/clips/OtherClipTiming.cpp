@@ -7,27 +7,11 @@
 #include "source/clips/OtherClip.h"
 #include "source/plugin/ResultChecks.h"
 
-NCFRESULT OtherClip::GetEditRate(Rational* editRate) const {
-    return GetEditRateBase(editRate);
-}
-
-NCFRESULT OtherClip::GetMovieLength(ncfUInt64* movieLength) const {
-    return GetMovieLengthBase(movieLength);
-}
-
 NCFRESULT OtherClip::SettleOnce(const char* ncfFunction, const EditorSettings& editorSettings) {
     if (length_ == 0) {
         NCF_RETURN(SetEditRateAndLengthImpl(editorSettings));
     }
     return NCF_OK;
-}
-
-NCFRESULT OtherClip::SetEditRateImpl(const EditorSettings& editorSettings) {
-    return SettleOnce("OtherClip::SetEditRateImpl", editorSettings);
-}
-
-NCFRESULT OtherClip::SetMovieLengthImpl(const EditorSettings& editorSettings) {
-    return SettleOnce("OtherClip::SetMovieLengthImpl", editorSettings);
 }
 
 // The lengths of the single tracks are asked for since the wrapper wants the

@@ -35,8 +35,6 @@ ncfUInt32 ReadNumber(NMAXmlElement& element, const char* attribute) {
 
 }  // namespace
 
-NMAParamValueInfo::~NMAParamValueInfo() = default;
-
 NMAXmlElement& NMAParamValueInfo::infoElement(NMAParamKind kind) const {
     NMAXmlElement* const found = Element().FindChild(NMAString(kParamKindNames[kind].info), 0);
     if (!found) {

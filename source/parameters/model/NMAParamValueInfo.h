@@ -13,8 +13,6 @@ namespace NMA::XMLUtils {
 // Get...Info and Set...Info of another kind throw NCF_E_UNEXPECTED.
 class NMAParamValueInfo : public NMAParamElement {
 public:
-    ~NMAParamValueInfo() override;
-
     // kParamKindOpaque when there is no child.
     ncfUInt32 GetKind() const;
     // Makes way for the new kind, whose attributes are then to be set. A child

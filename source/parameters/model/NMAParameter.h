@@ -3,6 +3,7 @@
 #pragma once
 
 #include "source/parameters/model/NMAParamElement.h"
+#include "source/parameters/model/ParamItems.h"
 #include "source/parameters/model/ParamText.h"
 #include "source/parameters/model/ParamVocabulary.h"
 
@@ -12,11 +13,15 @@ namespace NMA::XMLUtils {
 // NCF_E_UNEXPECTED. Opaque values and labels pass through untouched.
 class NMAParameter : public NMAParamElement {
 public:
-    ~NMAParameter() override;
-
-    NCFRESULT GetID(GUID& out) const;
-    bool IsSilent() const;
-    NCFRESULT SetSilent(bool silent);
+    NCFRESULT GetID(GUID& out) const {
+        out = GetParamId(Element());
+        return NCF_OK;
+    }
+    bool IsSilent() const { return GetParamFlag(Element(), kParamSilent); }
+    NCFRESULT SetSilent(bool silent) {
+        SetParamFlag(Element(), kParamSilent, silent);
+        return NCF_OK;
+    }
 
     NCFRESULT GetSInt32(ncfSInt32& out) const { return read(valueElement(kParamKindSInt32), out); }
     NCFRESULT SetSInt32(ncfSInt32 value) {
@@ -44,11 +49,17 @@ public:
     NCFRESULT SetRational(const NMAParamRational& value) {
         return write(valueElement(kParamKindRational), ParamText::Write(value));
     }
-    NCFRESULT GetBoolean(bool& out) const;
+    NCFRESULT GetBoolean(bool& out) const {
+        out = ParamText::IsTrue(textOf(valueElement(kParamKindBoolean)));
+        return NCF_OK;
+    }
     NCFRESULT SetBoolean(bool value) {
         return write(valueElement(kParamKindBoolean), ParamText::WriteFlag(value));
     }
-    NCFRESULT GetString(NMAString& out) const;
+    NCFRESULT GetString(NMAString& out) const {
+        valueElement(kParamKindString).GetText(out);
+        return NCF_OK;
+    }
     NCFRESULT SetString(const NMAString& value) {
         return write(valueElement(kParamKindString), value);
     }
