@@ -2,10 +2,12 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "host_interfaces/aaf/AAFTypeDefinitions.h"
+#include "host_interfaces/aaf/AAFTypeIds.h"
 #include "source/aaf/AAFSmartPointer.h"
 
 namespace NMA::Impl {
@@ -24,20 +26,30 @@ public:
     using TypeDef = IAAFSmartPointer<IAAFTypeDef>;
     using DataDef = IAAFSmartPointer<IAAFDataDef>;
 
-    const ClassDef& cdMasterMob();
-    const ClassDef& cdSourceMob();
-    const ClassDef& cdMultipleDescriptor();
-    const ClassDef& cdImportDescriptor();
-    const ClassDef& cdMPEGVideoDescriptor();
-    const ClassDef& cdRGBADescriptor();
-    const ClassDef& cdNetworkLocator();
-    const ClassDef& cdTaggedValue();
-    const ClassDef& cdSequence();
-    const ClassDef& cdTimecode();
-    const ClassDef& cdFiller();
+    const ClassDef& cdMasterMob() { return LookupClass(masterMob_, AUID_AAFMasterMob); }
+    const ClassDef& cdSourceMob() { return LookupClass(sourceMob_, AUID_AAFSourceMob); }
+    const ClassDef& cdMultipleDescriptor() {
+        return LookupClass(multipleDescriptor_, AUID_AAFMultipleDescriptor);
+    }
+    const ClassDef& cdImportDescriptor() {
+        return LookupClass(importDescriptor_, AUID_AAFImportDescriptor);
+    }
+    const ClassDef& cdMPEGVideoDescriptor() {
+        return LookupClass(mpegVideoDescriptor_, AUID_AAFMPEGVideoDescriptor);
+    }
+    const ClassDef& cdRGBADescriptor() {
+        return LookupClass(rgbaDescriptor_, AUID_AAFRGBADescriptor);
+    }
+    const ClassDef& cdNetworkLocator() {
+        return LookupClass(networkLocator_, AUID_AAFNetworkLocator);
+    }
+    const ClassDef& cdTaggedValue() { return LookupClass(taggedValue_, AUID_AAFTaggedValue); }
+    const ClassDef& cdSequence() { return LookupClass(sequence_, AUID_AAFSequence); }
+    const ClassDef& cdTimecode() { return LookupClass(timecode_, AUID_AAFTimecode); }
+    const ClassDef& cdFiller() { return LookupClass(filler_, AUID_AAFFiller); }
 
-    const TypeDef& tdInt32();
-    const TypeDef& tdRational();
+    const TypeDef& tdInt32() { return LookupType(int32_, kAAFTypeID_Int32); }
+    const TypeDef& tdRational() { return LookupType(rational_, kAAFTypeID_Rational); }
 
     const DataDef& ddTimecode();
 

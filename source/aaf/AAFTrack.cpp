@@ -5,8 +5,8 @@
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFMobSlots.h"
-#include "source/aaf/AAFGuard.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -30,7 +30,7 @@ NCFRESULT AddAAFTrack(const aafUID_t& dataDefUID, const aafCharacter* /*slotForm
                       IAAFSmartPointer<IAAFSourceMob> pFileMob,
                       IAAFSmartPointer<IAAFMob> pMobSourceMob,
                       IAAFSmartPointer<IAAFSourceMob> pSourceMob, aafPosition_t startTime) {
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         aafSourceRef_t toFileMob{};
         aafSourceRef_t toSourceMob{};
         ThrowIfFailed(pMobFileMob->GetMobID(&toFileMob.sourceID));

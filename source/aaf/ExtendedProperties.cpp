@@ -10,9 +10,9 @@
 #include "host_interfaces/aaf/AAFObjects.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "source/aaf/AAFDefs.h"
-#include "source/aaf/AAFGuard.h"
 #include "source/aaf/PropertyRegistration.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -72,7 +72,7 @@ void PutBox(const IAAFSmartPointer<IAAFClassDef>& pClassDef,
 NCFRESULT InitializeNivoBoundsBoxType(IAAFSmartPointer<IAAFDictionary> pDictionary,
                                       IAAFSmartPointer<IAAFTypeDef> pTypeDef) {
     NCF_FUNCTION("NMA::Impl::InitializeNivoBoundsBoxType");
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         AAFDefs defs(pDictionary);
         IAAFSmartPointer<IAAFTypeDefRecord> pTDRec;
         NCF_RETURN(pTypeDef->QueryInterface(IID_IAAFTypeDefRecord, (void**) &pTDRec));
@@ -117,7 +117,7 @@ NCFRESULT SetAVCISliceCount(IAAFSmartPointer<IAAFHeader> /*pHeader*/,
 NCFRESULT PutBoxesToAAF(IAAFSmartPointer<IAAFDictionary> pDictionary,
                         IAAFSmartPointer<IAAFDigitalImageDescriptor> pDigitalImageDescriptor,
                         const GeometryDetails& geometryDetails) {
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         IAAFSmartPointer<IAAFClassDef> pClassDef;
         ThrowIfFailed(pDictionary->LookupClassDef(AUID_AAFDigitalImageDescriptor, &pClassDef));
         const IAAFSmartPointer<IAAFTypeDef> pTypeDef = RequireBoundsBoxType(pDictionary);

@@ -8,14 +8,14 @@
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/aaf/AAFDefs.h"
-#include "source/aaf/AAFGuard.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
 NCFRESULT AddLocator(const NMAString& theMoviePathW, IAAFSmartPointer<IAAFDictionary> pDictionary,
                      IAAFSmartPointer<IAAFEssenceDescriptor> pEssenceDesc) {
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         NMAString url;
         ThrowIfFailed(MakeURLPathFromFilePath(theMoviePathW.InArg(), url.OutArg()));
         AAFDefs defs(pDictionary);
@@ -32,7 +32,7 @@ NCFRESULT AddLocator(const NMAString& theMoviePathW, IAAFSmartPointer<IAAFDictio
 
 NCFRESULT AddStartTimeToSourceClip(IAAFSmartPointer<IAAFMob> pMobFileMob,
                                    aafPosition_t absoluteStartTime) {
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         IAAFSmartPointer<IEnumAAFMobSlots> pSlots;
         ThrowIfFailed(pMobFileMob->GetSlots(&pSlots));
         IAAFSmartPointer<IAAFMobSlot> pSlot;

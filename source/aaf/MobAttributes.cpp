@@ -8,15 +8,15 @@
 #include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "source/aaf/AAFDefs.h"
-#include "source/aaf/AAFGuard.h"
 #include "source/aaf/PropertyRegistration.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
 NCFRESULT AddMasterMobAppCode(IAAFSmartPointer<IAAFDictionary> pDictionary,
                               IAAFSmartPointer<IAAFMasterMob> pMasterMob, aafInt32 appCode) {
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         IAAFSmartPointer<IAAFObject> pObject;
         ThrowIfFailed(pMasterMob->QueryInterface(IID_IAAFObject, (void**)&pObject));
         IAAFSmartPointer<IAAFTypeDef> pTypeDef;
@@ -38,7 +38,7 @@ NCFRESULT AddMasterMobAppCode(IAAFSmartPointer<IAAFDictionary> pDictionary,
 
 NCFRESULT AddMasterMobAttributes(IAAFSmartPointer<IAAFDictionary> pDictionary,
                                  IAAFSmartPointer<IAAFMasterMob> pMasterMob) {
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         IAAFSmartPointer<IAAFTypeDef> pTypeDef;
         ThrowIfFailed(
             pDictionary->LookupTypeDef(kAAFTypeID_TaggedValueStrongReferenceVector, &pTypeDef));

@@ -12,7 +12,6 @@
 #include "host_interfaces/Version.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/aaf/AAFDefs.h"
-#include "source/aaf/AAFGuard.h"
 #include "source/aaf/AAFRunTimeLibrary.h"
 #include "source/aaf/BinColumnMapping.h"
 #include "source/aaf/ClipDescription.h"
@@ -23,6 +22,7 @@
 #include "source/aaf/RunSteps.h"
 #include "source/aaf/Tracks.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -172,7 +172,7 @@ NCFRESULT NewAAFFromMovie(std::tr1::shared_ptr<BaseClip> media, NCFSmartPtr<INCF
                           IAAFFile** pOutAAFFile, INCFComponentFactory* pComponentFactory) {
     CHK_INARG(media.get());
     CHK_INARG(pOutAAFFile);
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         const NCFSmartPtr<INCFString> fileName = media->GetFileName();
         if (fileName && fileName->IsEmpty()) {
             throw NCF_E_INVALIDARG;

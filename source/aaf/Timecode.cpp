@@ -14,10 +14,10 @@
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFTimecodes.h"
 #include "source/aaf/AAFDefs.h"
-#include "source/aaf/AAFGuard.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -142,7 +142,7 @@ NCFRESULT AddTimecodeAAFTrack(const aafTimecode_t& timecode, ncfUInt32 tcTrackNu
                               IAAFSmartPointer<IAAFDictionary> pDictionary,
                               IAAFSmartPointer<IAAFMob> pMobSourceMob) {
     NCF_FUNCTION("NMA::Impl::AddTimecodeAAFTrack");
-    return GuardAAF([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         aafMobID_t sourceMobID{};
         ThrowIfFailed(pMobSourceMob->GetMobID(&sourceMobID));
         const std::wstring label =

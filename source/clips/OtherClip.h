@@ -33,8 +33,10 @@ public:
     NCFRESULT GetTimeCodeTrackMetadata(ncfUInt32 qtTrack, TimeCodeTrackMetadata* tcInfo) override;
     NCFRESULT GetAudioTrackMetadata(ncfUInt32 qtTrack, AudioTrackMetadata* audioInfo) override;
     NCFRESULT IsAudioLPCM(ncfUInt32 qtTrack, ncfBool* isLPCM) override;
-    NCFRESULT GetEditRate(Rational* editRate) const override;
-    NCFRESULT GetMovieLength(ncfUInt64* movieLength) const override;
+    NCFRESULT GetEditRate(Rational* editRate) const override { return GetEditRateBase(editRate); }
+    NCFRESULT GetMovieLength(ncfUInt64* movieLength) const override {
+        return GetMovieLengthBase(movieLength);
+    }
     NCFRESULT GetCreationTime(ncfUInt64* creationTime) override;
     NCFRESULT GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) override;
     NCFRESULT GetContentForHash(std::vector<ncfUInt8>& pContent) override;
@@ -64,8 +66,12 @@ public:
     NCFRESULT SetColorSpaceImpl() override;
     NCFRESULT SetGeometryImpl() override;
     // Rate and length are settled together by whichever comes first, once.
-    NCFRESULT SetEditRateImpl(const EditorSettings& editorSettings) override;
-    NCFRESULT SetMovieLengthImpl(const EditorSettings& editorSettings) override;
+    NCFRESULT SetEditRateImpl(const EditorSettings& editorSettings) override {
+        return SettleOnce("OtherClip::SetEditRateImpl", editorSettings);
+    }
+    NCFRESULT SetMovieLengthImpl(const EditorSettings& editorSettings) override {
+        return SettleOnce("OtherClip::SetMovieLengthImpl", editorSettings);
+    }
     NCFRESULT GetEncodedWidthAndHeightImpl(ncfUInt32* width, ncfUInt32* height) override;
     NCFRESULT GetImageAspectRatioImpl(ncfUInt32* numerator, ncfUInt32* denominator) override;
     NCFRESULT GetTimeCodeTrackCountImpl(ncfUInt32* trackCount) override;
@@ -85,7 +91,7 @@ private:
     static constexpr ncfUInt32 kMostTracks = 65535;
 
     ncfUInt32 HighestTrack() const;
-    ncfUInt32 CountTracks(TrackTest test) const;
+    NCFRESULT CountTracks(const char* ncfFunction, TrackTest test, ncfUInt32* trackCount) const;
     // Number of the `index`th track that passes the test; false past the end,
     // with `qtTrack` untouched.
     bool FindTrack(TrackTest test, ncfUInt32 index, ncfUInt32& qtTrack) const;
@@ -95,6 +101,8 @@ private:
     // Both size and ratio, in one answer of the wrapper; nothing without a
     // picture, which `hasPicture` tells.
     NCFRESULT ReadMovieBox(const char* function, bool& hasPicture);
+    // For the operation that logs.
+    NCFRESULT SettleOnce(const char* ncfFunction, const EditorSettings& editorSettings);
     NCFRESULT SetEditRateAndLengthImpl(const EditorSettings& editorSettings);
     // Whether tracks of either kind disagree with the movie's length.
     NCFRESULT FindDurationIssues(const char* function, ncfBool& sound, ncfBool& picture);

@@ -7,29 +7,10 @@
 #include "source/clips/OtherClip.h"
 #include "source/plugin/ResultChecks.h"
 
-NCFRESULT OtherClip::GetEditRate(Rational* editRate) const {
-    return GetEditRateBase(editRate);
-}
-
-NCFRESULT OtherClip::GetMovieLength(ncfUInt64* movieLength) const {
-    return GetMovieLengthBase(movieLength);
-}
-
-NCFRESULT OtherClip::SetEditRateImpl(const EditorSettings& editorSettings) {
-    NCF_FUNCTION("OtherClip::SetEditRateImpl");
-    if (length_ != 0) {
-        return NCF_OK;
+NCFRESULT OtherClip::SettleOnce(const char* ncfFunction, const EditorSettings& editorSettings) {
+    if (length_ == 0) {
+        NCF_RETURN(SetEditRateAndLengthImpl(editorSettings));
     }
-    NCF_RETURN(SetEditRateAndLengthImpl(editorSettings));
-    return NCF_OK;
-}
-
-NCFRESULT OtherClip::SetMovieLengthImpl(const EditorSettings& editorSettings) {
-    NCF_FUNCTION("OtherClip::SetMovieLengthImpl");
-    if (length_ != 0) {
-        return NCF_OK;
-    }
-    NCF_RETURN(SetEditRateAndLengthImpl(editorSettings));
     return NCF_OK;
 }
 

@@ -18,14 +18,18 @@ ncfUInt32 OtherClip::HighestTrack() const {
     return std::min(qtWrapper_->GetNumberOfTracks(), kMostTracks);
 }
 
-ncfUInt32 OtherClip::CountTracks(TrackTest test) const {
+NCFRESULT OtherClip::CountTracks(const char* ncfFunction, TrackTest test,
+                                 ncfUInt32* trackCount) const {
+    CHK_PTR(trackCount);
+    CHK_PTR(qtWrapper_);
     IQuickTimeWrapper& wrapper = *qtWrapper_.inArg();
     const ncfUInt32 highest = HighestTrack();
     ncfUInt32 count = 0;
     for (ncfUInt32 number = 0; number <= highest; ++number) {
         count += (wrapper.*test)(number) ? 1 : 0;
     }
-    return count;
+    *trackCount = count;
+    return NCF_OK;
 }
 
 bool OtherClip::FindTrack(TrackTest test, ncfUInt32 index, ncfUInt32& qtTrack) const {
@@ -54,27 +58,18 @@ NCFRESULT OtherClip::GetTrackCount(ncfUInt32* trackCount) {
 }
 
 NCFRESULT OtherClip::GetVideoTrackCountImpl(ncfUInt32* trackCount) {
-    NCF_FUNCTION("OtherClip::GetVideoTrackCountImpl");
-    CHK_PTR(trackCount);
-    CHK_PTR(qtWrapper_);
-    *trackCount = CountTracks(&IQuickTimeWrapper::IsVideoTrack);
-    return NCF_OK;
+    return CountTracks("OtherClip::GetVideoTrackCountImpl", &IQuickTimeWrapper::IsVideoTrack,
+                       trackCount);
 }
 
 NCFRESULT OtherClip::GetAudioTrackCountImpl(ncfUInt32* trackCount) {
-    NCF_FUNCTION("OtherClip::GetAudioTrackCountImpl");
-    CHK_PTR(trackCount);
-    CHK_PTR(qtWrapper_);
-    *trackCount = CountTracks(&IQuickTimeWrapper::IsAudioTrack);
-    return NCF_OK;
+    return CountTracks("OtherClip::GetAudioTrackCountImpl", &IQuickTimeWrapper::IsAudioTrack,
+                       trackCount);
 }
 
 NCFRESULT OtherClip::GetTimeCodeTrackCountImpl(ncfUInt32* trackCount) {
-    NCF_FUNCTION("OtherClip::GetTimeCodeTrackCountImpl");
-    CHK_PTR(trackCount);
-    CHK_PTR(qtWrapper_);
-    *trackCount = CountTracks(&IQuickTimeWrapper::IsTimeCodeTrack);
-    return NCF_OK;
+    return CountTracks("OtherClip::GetTimeCodeTrackCountImpl", &IQuickTimeWrapper::IsTimeCodeTrack,
+                       trackCount);
 }
 
 // --- numbers and kinds ----------------------------------------------------------------

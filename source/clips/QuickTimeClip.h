@@ -26,15 +26,23 @@ public:
     NCFRESULT GetVendor(ncfUInt32* vendor) const override;
     NCFRESULT GetNivoResolution(ncfUInt32* vcID) const override;
     NCFRESULT GetTrackCount(ncfUInt32* trackCount) override;
-    NCFRESULT GetVideoTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) override;
-    NCFRESULT GetAudioTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) override;
-    NCFRESULT GetTimecodeTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) override;
+    NCFRESULT GetVideoTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) override {
+        return FindTrack(track, kTrackVideo, qtTrack);
+    }
+    NCFRESULT GetAudioTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) override {
+        return FindTrack(track, kTrackAudio, qtTrack);
+    }
+    NCFRESULT GetTimecodeTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) override {
+        return FindTrack(track, kTrackTimecode, qtTrack);
+    }
     NCFRESULT GetTrackType(ncfUInt32 qtTrack, ncfUInt32* trackType) override;
     NCFRESULT GetTimeCodeTrackMetadata(ncfUInt32 qtTrack, TimeCodeTrackMetadata* tcInfo) override;
     NCFRESULT GetAudioTrackMetadata(ncfUInt32 qtTrack, AudioTrackMetadata* audioInfo) override;
     NCFRESULT IsAudioLPCM(ncfUInt32 qtTrack, ncfBool* isLPCM) override;
-    NCFRESULT GetEditRate(Rational* editRate) const override;
-    NCFRESULT GetMovieLength(ncfUInt64* movieLength) const override;
+    NCFRESULT GetEditRate(Rational* editRate) const override { return GetEditRateBase(editRate); }
+    NCFRESULT GetMovieLength(ncfUInt64* movieLength) const override {
+        return GetMovieLengthBase(movieLength);
+    }
     NCFRESULT GetCreationTime(ncfUInt64* creationTime) override;
     NCFRESULT GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) override;
     NCFRESULT GetContentForHash(std::vector<ncfUInt8>& content) override;

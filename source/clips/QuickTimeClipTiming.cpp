@@ -18,14 +18,6 @@ constexpr double kSlowestRate = 0.01;
 
 }  // namespace
 
-NCFRESULT QuickTimeClip::GetEditRate(Rational* editRate) const {
-    return GetEditRateBase(editRate);
-}
-
-NCFRESULT QuickTimeClip::GetMovieLength(ncfUInt64* movieLength) const {
-    return GetMovieLengthBase(movieLength);
-}
-
 // A video track gives the rate; without one the editor's rate stands in. The
 // forced rate is taken first but never outlasts the steps behind it.
 NCFRESULT QuickTimeClip::SetEditRateImpl(const EditorSettings& editorSettings) {

@@ -19,18 +19,6 @@ NCFRESULT QuickTimeClip::FindTrack(ncfUInt32 index, ncfUInt32 type, ncfUInt32& q
     return NCF_E_NOTFOUND;
 }
 
-NCFRESULT QuickTimeClip::GetVideoTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) {
-    return FindTrack(track, kTrackVideo, qtTrack);
-}
-
-NCFRESULT QuickTimeClip::GetAudioTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) {
-    return FindTrack(track, kTrackAudio, qtTrack);
-}
-
-NCFRESULT QuickTimeClip::GetTimecodeTrackQTId(ncfUInt32 track, ncfUInt32& qtTrack) {
-    return FindTrack(track, kTrackTimecode, qtTrack);
-}
-
 NCFRESULT QuickTimeClip::GetTrackType(ncfUInt32 qtTrack, ncfUInt32* trackType) {
     NCF_FUNCTION("QuickTimeClip::GetTrackType");
     CHK_INARG(trackType);

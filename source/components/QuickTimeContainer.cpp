@@ -11,9 +11,9 @@
 #include "source/components/FileTypes.h"
 #include "source/components/HostServices.h"
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -34,7 +34,7 @@ NCFSmartPtr<INCFString> NewString(const ncfUTF16LiteralToUTF16& text) {
 }  // namespace
 
 NCFRESULT QuickTimeContainer::InitializeInstance(INCFUnknown* host) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         TakeComponentFactory(host, componentFactory_);
         TakeConsole(host, console_);
         // A host without it answers GetCapabilities with the default.
@@ -60,7 +60,7 @@ NCFRESULT QuickTimeContainer::IsContainerSupported() {
 
 NCFRESULT QuickTimeContainer::GetAAFMasterClips(IAAFClips** ppClips) {
     NCF_FUNCTION("NMA::Impl::QuickTimeContainer::GetAAFMasterClips");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         if (ppClips) {
             *ppClips = nullptr;
         }
@@ -92,7 +92,7 @@ NCFRESULT QuickTimeContainer::GetAAFMasterClips(IAAFClips** ppClips) {
 
 NCFRESULT QuickTimeContainer::SetFilePath(INCFString* path) {
     NCF_FUNCTION("NMA::Impl::QuickTimeContainer::SetFilePath");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         if (!filePath_.isNull() && !filePath_->IsEmpty()) {
             ThrowIfFailed(NMA_E_ALREADYSET);
         }
@@ -113,7 +113,7 @@ NCFRESULT QuickTimeContainer::SetFilePath(INCFString* path) {
 // Each call makes a mapping of its own; all of them share the clip.
 NCFRESULT QuickTimeContainer::GetSampleMapping(ISampleMapping** ppSampleMapping) {
     NCF_FUNCTION("NMA::Impl::QuickTimeContainer::GetSampleMapping");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         if (ppSampleMapping) {
             *ppSampleMapping = nullptr;
         }
@@ -149,7 +149,7 @@ NCFRESULT QuickTimeContainer::GetCapabilities(ncfUInt32* flags) {
     if (!flags) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         ncfUInt32 value = 0;
         if (!settings_.isNull()) {
             settings_->GetValue(&value);
@@ -168,7 +168,7 @@ NCFRESULT QuickTimeContainer::GetFileType(ncfUInt32 index, INCFString** extensio
     if (index >= kFileTypeCount) {
         return NCF_E_NOTFOUND;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         struct Column {
             INCFString** out;
             const ncfUTF16LiteralToUTF16& text;
@@ -200,7 +200,7 @@ NCFRESULT QuickTimeContainer::GetFileType(ncfUInt32 index, INCFString** extensio
 }
 
 NCFRESULT QuickTimeContainer::GetMetadata(ncfSInt32 index, IAAFFile** ppData) {
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         if (ppData) {
             *ppData = nullptr;
         }

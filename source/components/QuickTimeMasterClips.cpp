@@ -9,12 +9,12 @@
 #include "source/clips/LoadMedia.h"
 #include "source/components/HostServices.h"
 #include "source/components/MoviePattern.h"
-#include "source/plugin/InterfaceEntry.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
 NCFRESULT QuickTimeMasterClips::InitializeInstance(INCFUnknown* host) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         TakeComponentFactory(host, _pComponentFactory);
         TakeConsole(host, _pConsole);
         return NCF_OK;
@@ -46,8 +46,7 @@ NCFRESULT QuickTimeMasterClips::GetClipPath(ncfSInt32 index, INCFString* path) {
     if (index < 0 || index >= GetCount() || !path) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry(
-        [&] { return path->Assign(_MCList[static_cast<std::size_t>(index)].InArg()); });
+    return ResultOf([&] { return path->Assign(_MCList[static_cast<std::size_t>(index)].InArg()); });
 }
 
 NCFRESULT QuickTimeMasterClips::GetMetadata(ncfSInt32 index, IAAFFile** ppData) {
@@ -58,7 +57,7 @@ NCFRESULT QuickTimeMasterClips::GetMetadata(ncfSInt32 index, IAAFFile** ppData) 
     if (index < 0 || index >= GetCount()) {
         return NCF_E_NOTFOUND;
     }
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         std::tr1::shared_ptr<BaseClip> media;
         // clang-format off
         NCF_RETURN(LoadMedia(_MCList[index].InArg(), _pConsole, _pComponentFactory, media));

@@ -6,12 +6,12 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/components/HostServices.h"
 #include "source/components/QuickTimeMasterClips.h"
-#include "source/plugin/InterfaceEntry.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
 NCFRESULT QuickTimeMediaFormat::InitializeInstance(INCFUnknown* host) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         TakeComponentFactory(host, componentFactory_);
         return NCF_OK;
     });
@@ -22,7 +22,7 @@ NCFRESULT QuickTimeMediaFormat::InternalQueryInterface(const GUID& iid, void** o
 }
 
 NCFRESULT QuickTimeMediaFormat::GetAAFClips(IAAFClips** clips) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         if (!clips) {
             return NCF_E_POINTER;
         }

@@ -9,7 +9,7 @@
 #include "source/components/MoviePattern.h"
 #include "source/components/QuickTimeMediaFormat.h"
 #include "source/components/QuickTimeVolumeInfo.h"
-#include "source/plugin/InterfaceEntry.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -25,7 +25,7 @@ INCFString* Needed(INCFString* path) {
 }  // namespace
 
 NCFRESULT QuickTimeMediaVolume::InitializeInstance(INCFUnknown* host) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         TakeComponentFactory(host, componentFactory_);
         return NCF_OK;
     });
@@ -55,7 +55,7 @@ NCFRESULT QuickTimeMediaVolume::GetVolumeInfo(INCFString* path, IVolumeInfo** in
     if (!info) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         CreateOwnComponent<QuickTimeVolumeInfo>(componentFactory_.inArg(),
                                                 CompID_QuickTimeVolumeInfo, IID_IVolumeInfo, info)
             .SetVolumePath(Needed(path));
@@ -67,7 +67,7 @@ NCFRESULT QuickTimeMediaVolume::GetMediaFormat(INCFString* path, IMediaFormat** 
     if (!format) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         CreateOwnComponent<QuickTimeMediaFormat>(
             componentFactory_.inArg(), CompID_QuickTimeMediaFormat, IID_IMediaFormat, format)
             .SetVolumePath(Needed(path));

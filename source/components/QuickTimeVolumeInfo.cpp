@@ -8,9 +8,9 @@
 
 #include "host_interfaces/util/NMAVolume.h"
 #include "source/components/MoviePattern.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/NCFSmartPtr.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
@@ -22,7 +22,7 @@ NCFRESULT QuickTimeVolumeInfo::GetSerialNumber(ncfUInt32* serial) {
     if (!serial) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         *serial = NMAVolume(volumePath_.InArg()).GetVolumeSerialNumber();
         return NCF_OK;
     });
@@ -32,7 +32,7 @@ NCFRESULT QuickTimeVolumeInfo::GetLabel(INCFString** label) {
     if (!label) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         *label = nullptr;
         *label = NMAVolume(volumePath_.InArg()).GetVolumeLabel();
         return NCF_OK;
@@ -43,7 +43,7 @@ NCFRESULT QuickTimeVolumeInfo::GetType(ncfUInt32* type) {
     if (!type) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         *type = NMAVolume(volumePath_.InArg()).GetVolumeType();
         return NCF_OK;
     });
@@ -54,7 +54,7 @@ NCFRESULT QuickTimeVolumeInfo::GetModificationDate(ncfUInt32* date) {
     if (!date) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         ncfUInt32 newest = 0;
         NMAVolume volume(volumePath_.InArg());
         void* handle = nullptr;
@@ -82,7 +82,7 @@ NCFRESULT QuickTimeVolumeInfo::VolumeQueryD() {
 }
 
 NCFRESULT QuickTimeVolumeInfo::GetVolumeName(INCFString** name) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         if (volumePath_.IsEmpty()) {
             return NMA_E_NOTINITIALIZED;
         }

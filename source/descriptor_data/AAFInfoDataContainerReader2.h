@@ -38,30 +38,64 @@ public:
     NCFRESULT IsDescriptorMPEG2(bool* isMPEG2);
     NCFRESULT IsDescriptorRGBA(bool* isRGBA);
 
-    NCFRESULT GetPictureEssenceCodingFromVCID(aafUID_t* outUID);
-    NCFRESULT GetEssenceContainerLabelFromVCID(aafUID_t* outUID);
-    NCFRESULT GetFrameLayoutFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetStoredWidthFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetStoredHeightFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetSampledWidthFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetDisplayWidthFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetDisplayHeightFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetDisplayYOffsetFromVCID(ncfUInt32* outValue);
+    NCFRESULT GetPictureEssenceCodingFromVCID(aafUID_t* out) {
+        return GetUID("rp210:PictureEssenceCoding", out);
+    }
+    NCFRESULT GetEssenceContainerLabelFromVCID(aafUID_t* out) {
+        return GetUID("rp210:EssenceContainerLabel", out);
+    }
+    NCFRESULT GetFrameLayoutFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:FrameLayout", out);
+    }
+    NCFRESULT GetStoredWidthFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:StoredWidth", out);
+    }
+    NCFRESULT GetStoredHeightFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:StoredHeight", out);
+    }
+    NCFRESULT GetSampledWidthFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:SampledWidth", out);
+    }
+    NCFRESULT GetDisplayWidthFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:DisplayWidth", out);
+    }
+    NCFRESULT GetDisplayHeightFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:DisplayHeight", out);
+    }
+    NCFRESULT GetDisplayYOffsetFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:DisplayYOffset", out);
+    }
     // A few ids start at 0 whatever the file says.
     NCFRESULT GetImageStartOffsetFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetImageAlignmentOffsetFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetComponentDepthFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetHorizontalSubsamplingFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetVerticalSubsamplingFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetColorSitingFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetColorRangeFromVCID(ncfUInt32* outValue);
+    NCFRESULT GetImageAlignmentOffsetFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:ImageAlignmentOffset", out);
+    }
+    NCFRESULT GetComponentDepthFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:ComponentDepth", out);
+    }
+    NCFRESULT GetHorizontalSubsamplingFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:HorizontalSubsampling", out);
+    }
+    NCFRESULT GetVerticalSubsamplingFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:VerticalSubsampling", out);
+    }
+    NCFRESULT GetColorSitingFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:ColorSiting", out);
+    }
+    NCFRESULT GetColorRangeFromVCID(ncfUInt32* out) {
+        return GetOneProperty("rp210:ColorRange", out);
+    }
     // These two choose their element by what the last search found: ask
     // IsDescriptorRGBA first.
-    NCFRESULT GetBlackRefLevelFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetWhiteRefLevelFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetMaxGOPFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetBitRateFromVCID(ncfUInt32* outValue);
-    NCFRESULT GetAVCSliceCounter(ncfUInt32* outValue);
+    NCFRESULT GetBlackRefLevelFromVCID(ncfUInt32* out) {
+        return GetOneProperty(isRGBA_ ? "rp210:ComponentMinRef" : "rp210:BlackRefLevel", out);
+    }
+    NCFRESULT GetWhiteRefLevelFromVCID(ncfUInt32* out) {
+        return GetOneProperty(isRGBA_ ? "rp210:ComponentMaxRef" : "rp210:WhiteReflevel", out);
+    }
+    NCFRESULT GetMaxGOPFromVCID(ncfUInt32* out) { return GetOneProperty("rp210:MaxGOP", out); }
+    NCFRESULT GetBitRateFromVCID(ncfUInt32* out) { return GetOneProperty("rp210:BitRate", out); }
+    NCFRESULT GetAVCSliceCounter(ncfUInt32* out) { return GetOneProperty("AVCSliceCounter", out); }
     NCFRESULT GetAspectRatioFromVCID(ncfUInt32* outNumerator, ncfUInt32* outDenominator);
     // Two hexadecimal digits behind "0x"; another text is passed over.
     NCFRESULT GetProfileAndLevelFromVCID(ncfUInt8* outProfileAndLevel);

@@ -26,42 +26,6 @@ bool StartsAtZero(ncfUInt32 vcid) {
 
 }  // namespace
 
-NCFRESULT AAFInfoDataContainerReader2::GetPictureEssenceCodingFromVCID(aafUID_t* outUID) {
-    return GetUID("rp210:PictureEssenceCoding", outUID);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetEssenceContainerLabelFromVCID(aafUID_t* outUID) {
-    return GetUID("rp210:EssenceContainerLabel", outUID);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetFrameLayoutFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:FrameLayout", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetStoredWidthFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:StoredWidth", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetStoredHeightFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:StoredHeight", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetSampledWidthFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:SampledWidth", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetDisplayWidthFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:DisplayWidth", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetDisplayHeightFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:DisplayHeight", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetDisplayYOffsetFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:DisplayYOffset", outValue);
-}
-
 NCFRESULT AAFInfoDataContainerReader2::GetImageStartOffsetFromVCID(ncfUInt32* outValue) {
     NCF_FUNCTION("AAFInfoDataContainerReader2::GetImageStartOffsetFromVCID");
     if (StartsAtZero(m_curVCID)) {
@@ -70,50 +34,6 @@ NCFRESULT AAFInfoDataContainerReader2::GetImageStartOffsetFromVCID(ncfUInt32* ou
         return NCF_OK;
     }
     return GetOneProperty("rp210:ImageStartOffset", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetImageAlignmentOffsetFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:ImageAlignmentOffset", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetComponentDepthFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:ComponentDepth", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetHorizontalSubsamplingFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:HorizontalSubsampling", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetVerticalSubsamplingFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:VerticalSubsampling", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetColorSitingFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:ColorSiting", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetColorRangeFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:ColorRange", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetBlackRefLevelFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty(isRGBA_ ? "rp210:ComponentMinRef" : "rp210:BlackRefLevel", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetWhiteRefLevelFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty(isRGBA_ ? "rp210:ComponentMaxRef" : "rp210:WhiteReflevel", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetMaxGOPFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:MaxGOP", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetBitRateFromVCID(ncfUInt32* outValue) {
-    return GetOneProperty("rp210:BitRate", outValue);
-}
-
-NCFRESULT AAFInfoDataContainerReader2::GetAVCSliceCounter(ncfUInt32* outValue) {
-    return GetOneProperty("AVCSliceCounter", outValue);
 }
 
 NCFRESULT AAFInfoDataContainerReader2::GetAspectRatioFromVCID(ncfUInt32* outNumerator,

@@ -8,7 +8,7 @@ namespace {
 using Reader = AAFInfoDataContainerReader2;
 
 // What it means that an entry is silent on a field.
-enum class Silence {
+enum Silence {
     kFails,
     kKeepsDefault,
     kKeepsDefaultInRGBA,  // and fails elsewhere
@@ -22,87 +22,71 @@ struct Field {
     void (*substitute)(AAFInfo& info) = nullptr;
 };
 
-// clang-format off
+// Reads a value that fills one field.
+template <auto getter, auto field>
+NCFRESULT Read(Reader& reader, AAFInfo& info) {
+    return (reader.*getter)(&(info.*field));
+}
+
 constexpr Field kPictureFields[] = {
     {kContainerLabelGetter,
-     [](Reader& r, AAFInfo& i) { return r.GetEssenceContainerLabelFromVCID(&i.essenceContainerLabel); },
-     Silence::kFails},
-    {"GetFrameLayoutFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetFrameLayoutFromVCID(&i.frameLayout); },
-     Silence::kFails},
-    {"GetStoredWidthFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetStoredWidthFromVCID(&i.storedWidth); },
-     Silence::kFails},
-    {"GetStoredHeightFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetStoredHeightFromVCID(&i.storedHeight); },
-     Silence::kFails},
-    {"GetSampledWidthFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetSampledWidthFromVCID(&i.sampledWidth); },
-     Silence::kKeepsDefault, [](AAFInfo& i) { i.sampledWidth = i.storedWidth; }},
-    {"GetDisplayWidthFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetDisplayWidthFromVCID(&i.displayWidth); },
-     Silence::kKeepsDefault, [](AAFInfo& i) { i.displayWidth = i.storedWidth; }},
-    {"GetDisplayHeightFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetDisplayHeightFromVCID(&i.displayHeight); },
-     Silence::kKeepsDefault, [](AAFInfo& i) { i.displayHeight = i.storedHeight; }},
+     Read<&Reader::GetEssenceContainerLabelFromVCID, &AAFInfo::essenceContainerLabel>, kFails},
+    {"GetFrameLayoutFromVCID", Read<&Reader::GetFrameLayoutFromVCID, &AAFInfo::frameLayout>,
+     kFails},
+    {"GetStoredWidthFromVCID", Read<&Reader::GetStoredWidthFromVCID, &AAFInfo::storedWidth>,
+     kFails},
+    {"GetStoredHeightFromVCID", Read<&Reader::GetStoredHeightFromVCID, &AAFInfo::storedHeight>,
+     kFails},
+    {"GetSampledWidthFromVCID", Read<&Reader::GetSampledWidthFromVCID, &AAFInfo::sampledWidth>,
+     kKeepsDefault, [](AAFInfo& i) { i.sampledWidth = i.storedWidth; }},
+    {"GetDisplayWidthFromVCID", Read<&Reader::GetDisplayWidthFromVCID, &AAFInfo::displayWidth>,
+     kKeepsDefault, [](AAFInfo& i) { i.displayWidth = i.storedWidth; }},
+    {"GetDisplayHeightFromVCID", Read<&Reader::GetDisplayHeightFromVCID, &AAFInfo::displayHeight>,
+     kKeepsDefault, [](AAFInfo& i) { i.displayHeight = i.storedHeight; }},
     {"GetDisplayYOffsetFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetDisplayYOffsetFromVCID(&i.displayYOffset); },
-     Silence::kKeepsDefault},
+     Read<&Reader::GetDisplayYOffsetFromVCID, &AAFInfo::displayYOffset>, kKeepsDefault},
     {"GetAspectRatioFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetAspectRatioFromVCID(&i.aspectNumerator, &i.aspectDenominator); },
-     Silence::kFails},
+     [](Reader& r, AAFInfo& i) {
+         return r.GetAspectRatioFromVCID(&i.aspectNumerator, &i.aspectDenominator);
+     },
+     kFails},
     {"GetImageStartOffsetFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetImageStartOffsetFromVCID(&i.ImageStartOffset); },
-     Silence::kKeepsDefault},
+     Read<&Reader::GetImageStartOffsetFromVCID, &AAFInfo::ImageStartOffset>, kKeepsDefault},
     {"GetImageAlignmentOffsetFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetImageAlignmentOffsetFromVCID(&i.imageAlignmentOffset); },
-     Silence::kKeepsDefault},
+     Read<&Reader::GetImageAlignmentOffsetFromVCID, &AAFInfo::imageAlignmentOffset>, kKeepsDefault},
     {"GetPictureEssenceCodingFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetPictureEssenceCodingFromVCID(&i.pictureEssenceCoding); },
-     Silence::kFails},
+     Read<&Reader::GetPictureEssenceCodingFromVCID, &AAFInfo::pictureEssenceCoding>, kFails},
     {"GetComponentDepthFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetComponentDepthFromVCID(&i.componentDepth); },
-     Silence::kKeepsDefaultInRGBA},
-    {"GetVideoLineMapFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetVideoLineMapFromVCID(&i.videoLineMapVect); },
-     Silence::kFails},
+     Read<&Reader::GetComponentDepthFromVCID, &AAFInfo::componentDepth>, kKeepsDefaultInRGBA},
+    {"GetVideoLineMapFromVCID", Read<&Reader::GetVideoLineMapFromVCID, &AAFInfo::videoLineMapVect>,
+     kFails},
     {"GetHorizontalSubsamplingFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetHorizontalSubsamplingFromVCID(&i.horizontalSubsampling); },
-     Silence::kKeepsDefaultInRGBA},
+     Read<&Reader::GetHorizontalSubsamplingFromVCID, &AAFInfo::horizontalSubsampling>,
+     kKeepsDefaultInRGBA},
     {"GetVerticalSubsamplingFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetVerticalSubsamplingFromVCID(&i.verticalSubsampling); },
-     Silence::kKeepsDefaultInRGBA},
-    {"GetColorSitingFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetColorSitingFromVCID(&i.colorSiting); },
-     Silence::kKeepsDefaultInRGBA},
-    {"GetBlackRefLevelFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetBlackRefLevelFromVCID(&i.blackRefLevel); },
-     Silence::kFails},
-    {"GetWhiteRefLevelFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetWhiteRefLevelFromVCID(&i.whiteRefLevel); },
-     Silence::kFails},
-    {"GetColorRangeFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetColorRangeFromVCID(&i.colorRange); },
-     Silence::kKeepsDefaultInRGBA},
-    {"GetAVCSliceCounter",
-     [](Reader& r, AAFInfo& i) { return r.GetAVCSliceCounter(&i.sliceCounter); },
-     Silence::kKeepsDefault},
+     Read<&Reader::GetVerticalSubsamplingFromVCID, &AAFInfo::verticalSubsampling>,
+     kKeepsDefaultInRGBA},
+    {"GetColorSitingFromVCID", Read<&Reader::GetColorSitingFromVCID, &AAFInfo::colorSiting>,
+     kKeepsDefaultInRGBA},
+    {"GetBlackRefLevelFromVCID", Read<&Reader::GetBlackRefLevelFromVCID, &AAFInfo::blackRefLevel>,
+     kFails},
+    {"GetWhiteRefLevelFromVCID", Read<&Reader::GetWhiteRefLevelFromVCID, &AAFInfo::whiteRefLevel>,
+     kFails},
+    {"GetColorRangeFromVCID", Read<&Reader::GetColorRangeFromVCID, &AAFInfo::colorRange>,
+     kKeepsDefaultInRGBA},
+    {"GetAVCSliceCounter", Read<&Reader::GetAVCSliceCounter, &AAFInfo::sliceCounter>,
+     kKeepsDefault},
 };
 
 constexpr Field kMPEG2Fields[] = {
-    {"GetBitRateFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetBitRateFromVCID(&i.bitRate); }, Silence::kFails},
+    {"GetBitRateFromVCID", Read<&Reader::GetBitRateFromVCID, &AAFInfo::bitRate>, kFails},
     {"GetProfileAndLevelFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetProfileAndLevelFromVCID(&i.levelAndProfile); },
-     Silence::kFails},
-    {"GetMaxGOPFromVCID",
-     [](Reader& r, AAFInfo& i) { return r.GetMaxGOPFromVCID(&i.maxGOP); }, Silence::kFails},
+     Read<&Reader::GetProfileAndLevelFromVCID, &AAFInfo::levelAndProfile>, kFails},
+    {"GetMaxGOPFromVCID", Read<&Reader::GetMaxGOPFromVCID, &AAFInfo::maxGOP>, kFails},
 };
-// clang-format on
 
 bool MayBeSilent(const Field& field, bool isRGBA) {
-    return field.silence == Silence::kKeepsDefault ||
-           (field.silence == Silence::kKeepsDefaultInRGBA && isRGBA);
+    return field.silence == kKeepsDefault || (field.silence == kKeepsDefaultInRGBA && isRGBA);
 }
 
 template <std::size_t count>

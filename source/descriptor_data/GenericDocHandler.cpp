@@ -18,9 +18,19 @@ NCFRESULT TellResult(const char* where, NCFRESULT result, int line) {
     return result;
 }
 
-NCFRESULT TellUnknown(const char* where, int line) {
-    DataRecord(kDataFailure, where) << "Received an unknown exception, " << kSource << ":" << line;
-    return NCF_E_UNEXPECTED;
+// Runs a body that throws its failures, and tells them.
+template <class Body>
+NCFRESULT Told(const char* where, int line, Body body) {
+    try {
+        body();
+        return NCF_OK;
+    } catch (NCFRESULT result) {
+        return TellResult(where, result, line);
+    } catch (...) {
+        DataRecord(kDataFailure, where)
+            << "Received an unknown exception, " << kSource << ":" << line;
+        return NCF_E_UNEXPECTED;
+    }
 }
 
 NMAString Utf8(INCFString* text) {
@@ -62,29 +72,12 @@ NCFRESULT GenericDocHandler::Start() {
 }
 
 NCFRESULT GenericDocHandler::End() {
-    constexpr char where[] = "NMA::Impl::GenericDocHandler::End";
-    constexpr int line = 73;
-    try {
-        Container().End();
-        return NCF_OK;
-    } catch (NCFRESULT result) {
-        return TellResult(where, result, line);
-    } catch (...) {
-        return TellUnknown(where, line);
-    }
+    return Told("NMA::Impl::GenericDocHandler::End", 73, [&] { Container().End(); });
 }
 
 NCFRESULT GenericDocHandler::Element(INCFString* tag) {
-    constexpr char where[] = "NMA::Impl::GenericDocHandler::Element";
-    constexpr int line = 110;
-    try {
-        Container().Element(Utf8(tag));
-        return NCF_OK;
-    } catch (NCFRESULT result) {
-        return TellResult(where, result, line);
-    } catch (...) {
-        return TellUnknown(where, line);
-    }
+    return Told("NMA::Impl::GenericDocHandler::Element", 110,
+                [&] { Container().Element(Utf8(tag)); });
 }
 
 NCFRESULT GenericDocHandler::Attribute(INCFString* name, INCFString* value) {
@@ -97,16 +90,7 @@ NCFRESULT GenericDocHandler::Attribute(INCFString* name, INCFString* value) {
 }
 
 NCFRESULT GenericDocHandler::Text(INCFString* text) {
-    constexpr char where[] = "NMA::Impl::GenericDocHandler::Text";
-    constexpr int line = 184;
-    try {
-        Container().Text(Utf8(text));
-        return NCF_OK;
-    } catch (NCFRESULT result) {
-        return TellResult(where, result, line);
-    } catch (...) {
-        return TellUnknown(where, line);
-    }
+    return Told("NMA::Impl::GenericDocHandler::Text", 184, [&] { Container().Text(Utf8(text)); });
 }
 
 NCFRESULT GenericDocHandler::Warning(INCFString* message) {

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // The object: creation, the queries with what each prepares, and the
-// operations that start and stop the picture reader or do nothing.
+// operations that start and stop the picture reader.
 
 #include "source/essence/QuickTimeSampleMapping.h"
 
@@ -11,13 +11,13 @@
 #include "source/clips/LoadMedia.h"
 #include "source/essence/MappingAttachment.h"
 #include "source/essence/ProviderLock.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
 NCFRESULT QuickTimeSampleMapping::InitializeInstance(INCFUnknown* host) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         if (!host) {
             ThrowIfFailed(NCF_E_POINTER);
         }
@@ -38,7 +38,7 @@ NCFRESULT QuickTimeSampleMapping::InternalQueryInterface(const GUID& iid, void**
     if (!ppvObj) {
         return NCF_E_INVALIDARG;
     }
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         if (ncf_detail::AnswerInterface<ISampleMapping>(this, iid, ppvObj) ||
             ncf_detail::AnswerInterface<ISampleProvider>(this, iid, ppvObj)) {
             return NCF_OK;
@@ -160,35 +160,11 @@ NCFRESULT QuickTimeSampleMapping::SetupOrCleanup(ncfUInt32 trackNMA, bool setup)
 // clang-format on
 
 NCFRESULT QuickTimeSampleMapping::Setup(ncfUInt32 trackNMA) {
-    return InterfaceEntry([&] { return SetupOrCleanup(trackNMA, true); });
+    return ResultOf([&] { return SetupOrCleanup(trackNMA, true); });
 }
 
 NCFRESULT QuickTimeSampleMapping::Cleanup(ncfUInt32 trackNMA) {
-    return InterfaceEntry([&] { return SetupOrCleanup(trackNMA, false); });
-}
-
-// --- refused, and nothing to do -----------------------------------------------------------
-
-NCFRESULT QuickTimeSampleMapping::ProviderUnsupportedOperation(ncfUInt32, ncfUInt64, ncfUInt64) {
-    return NCF_E_NOTIMPL;
-}
-NCFRESULT QuickTimeSampleMapping::ProviderNoOperationA(ncfUInt32, ncfUInt64, ncfUInt64) {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::ProviderNoOperationB() {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::ImageProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) {
-    return NCF_E_NOTIMPL;
-}
-NCFRESULT QuickTimeSampleMapping::ImageProviderNoOperationA(ncfUInt32, ncfUInt32) {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::ImageProviderNoOperationB(ncfUInt32, float) {
-    return NCF_OK;
-}
-NCFRESULT QuickTimeSampleMapping::AudioProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) {
-    return NCF_E_NOTIMPL;
+    return ResultOf([&] { return SetupOrCleanup(trackNMA, false); });
 }
 
 }  // namespace NMA::Impl

@@ -53,10 +53,12 @@ public:
     // --- ISampleProvider ----------------------------------------------------------
 
     NCFRESULT Setup(ncfUInt32 trackNMA) override;
-    NCFRESULT ProviderUnsupportedOperation(ncfUInt32, ncfUInt64, ncfUInt64) override;
+    NCFRESULT ProviderUnsupportedOperation(ncfUInt32, ncfUInt64, ncfUInt64) override {
+        return NCF_E_NOTIMPL;
+    }
     NCFRESULT ProvideSampleRange(INCFAVBuffer* pAVBuffer, ncfUInt32 flags) override;
-    NCFRESULT ProviderNoOperationA(ncfUInt32, ncfUInt64, ncfUInt64) override;
-    NCFRESULT ProviderNoOperationB() override;
+    NCFRESULT ProviderNoOperationA(ncfUInt32, ncfUInt64, ncfUInt64) override { return NCF_OK; }
+    NCFRESULT ProviderNoOperationB() override { return NCF_OK; }
     NCFRESULT Cleanup(ncfUInt32 trackNMA) override;
 
     // --- IUncompressedImageProvider -------------------------------------------------
@@ -67,10 +69,12 @@ public:
                              ncfUInt32* componentRangeType, ncfUInt32* colorSpace,
                              ncfUInt32* fieldOrder, ncfUInt32* frameLayout,
                              ncfUInt32* orientation) override;
-    NCFRESULT ImageProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) override;
+    NCFRESULT ImageProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) override {
+        return NCF_E_NOTIMPL;
+    }
     NCFRESULT SetWorkingImageFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex) override;
-    NCFRESULT ImageProviderNoOperationA(ncfUInt32, ncfUInt32) override;
-    NCFRESULT ImageProviderNoOperationB(ncfUInt32, float) override;
+    NCFRESULT ImageProviderNoOperationA(ncfUInt32, ncfUInt32) override { return NCF_OK; }
+    NCFRESULT ImageProviderNoOperationB(ncfUInt32, float) override { return NCF_OK; }
     NCFRESULT GetWorkingImageSize(ncfUInt32 trackNMA, ncfUInt32* width, ncfUInt32* height) override;
     NCFRESULT GetWorkingImageBufferRequirements(ncfUInt32 trackNMA, ncfUInt16* bufferStartAlignment,
                                                 ncfUInt64* maxBufferSize) override;
@@ -80,7 +84,9 @@ public:
     NCFRESULT GetNumberOfAudioFormats(ncfUInt32 trackNMA, ncfUInt32* numFormats) override;
     NCFRESULT GetAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex, ncfUInt32* sampleFormat,
                              ncfUInt16* bytesPerSample, ncfUInt16* bitsPerSample) override;
-    NCFRESULT AudioProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) override;
+    NCFRESULT AudioProviderUnsupportedOperation(ncfUInt32, ncfUInt32, void*) override {
+        return NCF_E_NOTIMPL;
+    }
     NCFRESULT SetWorkingAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex) override;
 
     // --- ISampleMapping ----------------------------------------------------------------

@@ -5,9 +5,9 @@
 
 #include "source/essence/ProviderLock.h"
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
@@ -16,7 +16,7 @@ namespace NMA::Impl {
 
 NCFRESULT QuickTimeSampleMapping::GetNumberOfAudioFormats(ncfUInt32 trackNMA, ncfUInt32* numFormats) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfAudioFormats");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numFormats);
         std::tr1::shared_ptr<MediaTrack> track;
         NCF_RETURN(GetMediaTrack(trackNMA, track));
@@ -31,7 +31,7 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfAudioFormats(ncfUInt32 trackNMA, nc
 
 NCFRESULT QuickTimeSampleMapping::GetAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex, ncfUInt32* sampleFormat, ncfUInt16* bytesPerSample, ncfUInt16* bitsPerSample) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetAudioFormat");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(sampleFormat);
         CHK_INARG(bytesPerSample);
         CHK_INARG(bitsPerSample);
@@ -56,7 +56,7 @@ NCFRESULT QuickTimeSampleMapping::GetAudioFormat(ncfUInt32 trackNMA, ncfUInt32 f
 // it will deliver, and that number, not the file's, sizes what is delivered.
 NCFRESULT QuickTimeSampleMapping::SetWorkingAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::SetWorkingAudioFormat");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_PTR(_audioReaderHolder);
         std::tr1::shared_ptr<MediaTrack> track;
         NCF_RETURN(GetMediaTrack(trackNMA, track));

@@ -9,8 +9,8 @@
 #include "source/essence/PixelLevels.h"
 #include "source/essence/ProviderLock.h"
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -30,7 +30,7 @@ constexpr ncfUInt32 kAll = 0xFFFFFFFFu;
 // told to the reader still holds when it reads.
 NCFRESULT QuickTimeSampleMapping::ProvideSampleRange(INCFAVBuffer* pAVBuffer, ncfUInt32) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::ProvideSampleRange");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(pAVBuffer);
         const ProviderLock lock(providerLock_);
         ncfUInt32 trackNMA = 0;

@@ -7,8 +7,8 @@
 #include "source/essence/ProviderLock.h"
 #include "source/essence/QuickTimeSampleMapping.h"
 #include "source/essence/RoundUp.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -43,7 +43,7 @@ const char* LabelOf(ncfUInt32 fourCC) {
 
 NCFRESULT QuickTimeSampleMapping::GetNumberOfImageFormats(ncfUInt32 trackNMA, ncfUInt32* numFormats) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfImageFormats");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numFormats);
         std::tr1::shared_ptr<MediaTrack> track;
         NCF_RETURN(GetMediaTrack(trackNMA, track));
@@ -58,7 +58,7 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfImageFormats(ncfUInt32 trackNMA, nc
 // A bad track outranks a null pointer here; with sound it is the other way.
 NCFRESULT QuickTimeSampleMapping::GetImageFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex, ncfUInt32* pixelFormat, ncfUInt32* chromaSubSampling, ncfUInt32* componentFormat, ncfUInt32* componentRangeType, ncfUInt32* colorSpace, ncfUInt32* fieldOrder, ncfUInt32* frameLayout, ncfUInt32* orientation) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetImageFormat");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         std::tr1::shared_ptr<MediaTrack> track;
         NCF_RETURN(GetMediaTrack(trackNMA, track));
         if (!IsPictureTrack(*track)) {
@@ -95,7 +95,7 @@ NCFRESULT QuickTimeSampleMapping::GetImageFormat(ncfUInt32 trackNMA, ncfUInt32 f
 // then fails to start doesn't undo it.
 NCFRESULT QuickTimeSampleMapping::SetWorkingImageFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::SetWorkingImageFormat");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         std::tr1::shared_ptr<MediaTrack> track;
         NCF_RETURN(GetMediaTrack(trackNMA, track));
         if (!IsPictureTrack(*track)) {
@@ -163,7 +163,7 @@ ncfUInt32 QuickTimeSampleMapping::OutputFrameSize(const QTImageFormat& format, n
 // always that of a frame.
 NCFRESULT QuickTimeSampleMapping::GetWorkingImageSize(ncfUInt32, ncfUInt32* width, ncfUInt32* height) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetWorkingImageSize");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(width);
         CHK_INARG(height);
         if (!media_) {
@@ -190,7 +190,7 @@ NCFRESULT QuickTimeSampleMapping::GetWorkingImageSize(ncfUInt32, ncfUInt32* widt
 
 NCFRESULT QuickTimeSampleMapping::GetWorkingImageBufferRequirements(ncfUInt32 trackNMA, ncfUInt16* bufferStartAlignment, ncfUInt64* maxBufferSize) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetWorkingImageBufferRequirements");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(bufferStartAlignment);
         CHK_INARG(maxBufferSize);
         *bufferStartAlignment = 1;

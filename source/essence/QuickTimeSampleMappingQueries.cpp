@@ -8,9 +8,9 @@
 #include <cstring>
 
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/PluginLogger.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -59,7 +59,7 @@ bool IsBelow(ncfUInt64 left, ncfUInt64 right) {
 // The count is the answer itself; a failure is told from it by its sign.
 ncfSInt32 QuickTimeSampleMapping::GetNumberOfTracks() {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfTracks");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         if (!media_) {
             return NMA_E_NOTINITIALIZED;
         }
@@ -73,7 +73,7 @@ ncfSInt32 QuickTimeSampleMapping::GetNumberOfTracks() {
 // its headers.
 NCFRESULT QuickTimeSampleMapping::GetNumberOfChannels(ncfUInt32 trackNMA, ncfUInt32* numChannels) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfChannels");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_PTR(numChannels);
         *numChannels = 1;
         std::tr1::shared_ptr<MediaTrack> track;
@@ -95,7 +95,7 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfChannels(ncfUInt32 trackNMA, ncfUIn
 
 NCFRESULT QuickTimeSampleMapping::GetNumberOfSamples(ncfUInt32 trackNMA, ncfUInt64* numSamples) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfSamples");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numSamples);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
@@ -107,7 +107,7 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfSamples(ncfUInt32 trackNMA, ncfUInt
 // A size has 32 bits; the rest of the caller's variable stays as it is.
 NCFRESULT QuickTimeSampleMapping::GetSampleSize(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* sizeInBytesPtr) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSampleSize");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(sizeInBytesPtr);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
@@ -121,7 +121,7 @@ NCFRESULT QuickTimeSampleMapping::GetSampleSize(ncfUInt32 trackNMA, ncfUInt64 sa
 
 NCFRESULT QuickTimeSampleMapping::GetSamplePosition(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* positionInBytes) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSamplePosition");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(positionInBytes);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
@@ -134,7 +134,7 @@ NCFRESULT QuickTimeSampleMapping::GetSamplePosition(ncfUInt32 trackNMA, ncfUInt6
 
 NCFRESULT QuickTimeSampleMapping::GetSampleProperties(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* flagsPtr, ncfUInt32* numDependenciesPtr) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSampleProperties");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(flagsPtr);
         CHK_INARG(numDependenciesPtr);
         ncfUInt32 trackQT = 0;
@@ -159,7 +159,7 @@ NCFRESULT QuickTimeSampleMapping::GetSampleProperties(ncfUInt32 trackNMA, ncfUIn
 // its own end gives -1, with success.
 NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousSamples(ncfUInt32 trackNMA, ncfUInt64 sample, ncfSInt64* numSamples) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfContiguousSamples");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numSamples);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
@@ -186,7 +186,7 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousSamples(ncfUInt32 trackNM
 
 NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousBytes(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* numBytes) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfContiguousBytes");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numBytes);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));

@@ -7,8 +7,8 @@
 #include <limits>
 
 #include "source/essence/QuickTimeSampleMapping.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -30,7 +30,7 @@ ncfSInt64 Low32(ncfSInt64 value) {
 // clang-format off
 NCFRESULT QuickTimeSampleMapping::GetSampleTemporalOffset(ncfUInt32 trackNMA, ncfUInt64 sample, ncfSInt64* offsetInSamples) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSampleTemporalOffset");
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(offsetInSamples);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));

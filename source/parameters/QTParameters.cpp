@@ -8,13 +8,13 @@
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/parameters/QTParameterNames.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 
 NCFRESULT QTParameters::InitializeInstance(INCFUnknown* host) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         if (!host) {
             ThrowIfFailed(NCF_E_POINTER);
         }
@@ -55,7 +55,7 @@ void QTParameters::RequireClip(INCFString* xml) const {
 }
 
 NCFRESULT QTParameters::GetParameterValuesXML(INCFString* xml) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         RequireClip(xml);
         if (setId_ == GUID{}) {
             ThrowIfFailed(NMA_E_NOTINITIALIZED);
@@ -68,7 +68,7 @@ NCFRESULT QTParameters::GetParameterValuesXML(INCFString* xml) {
 }
 
 NCFRESULT QTParameters::GetParameterDescriptionXML(INCFString* xml) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         RequireClip(xml);
         const NCFSmartPtr<IParameterSuite> suite = NewSuite();
         WriteParameterDescription(suite.inArg());
@@ -79,7 +79,7 @@ NCFRESULT QTParameters::GetParameterDescriptionXML(INCFString* xml) {
 }
 
 NCFRESULT QTParameters::GetDefaultValuesXML(INCFString* xml) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         RequireClip(xml);
         const NCFSmartPtr<IParameterSuite> suite = NewSuite();
         WriteParamSet(suite.inArg(), kParamSetDefault, kDefaultSetName, defaultParams_);
@@ -91,7 +91,7 @@ NCFRESULT QTParameters::GetDefaultValuesXML(INCFString* xml) {
 // --- changes by the user ---------------------------------------------------------------
 
 NCFRESULT QTParameters::SetParameterValuesXML(INCFString* xml) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         RequireClip(xml);
         NCFSmartPtr<IParametersReader> reader;
         ThrowIfFailed(ncfCreate(componentFactory_.inArg(), CompID_ParametersReader,
@@ -117,7 +117,7 @@ NCFRESULT QTParameters::ParametersUnsupportedOperation(void*) {
 // its fields are worked out again. Neither the set's identifier nor the mapping
 // is touched: hosts hand values over next, and the mapping follows those.
 NCFRESULT QTParameters::ResetParameters() {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         if (!clipParams_) {
             ThrowIfFailed(NMA_E_NOTINITIALIZED);
         }

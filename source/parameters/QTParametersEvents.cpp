@@ -6,8 +6,8 @@
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "source/parameters/QTParameters.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 
 namespace NMA::Impl {
 namespace {
@@ -50,7 +50,7 @@ NCFRESULT QTParameters::EndComponent(ncfUInt32 isWhole) {
 }
 
 NCFRESULT QTParameters::BeginParamSet(const GUID& set, INCFString* name, float, ncfUInt32 state) {
-    return InterfaceEntry([&] {
+    return ResultOf([&] {
         inSet_ = state == kSetWithValues;
         if (state == kSetNotInUse) {
             return NCF_OK;
@@ -65,7 +65,7 @@ NCFRESULT QTParameters::BeginParamSet(const GUID& set, INCFString* name, float, 
 }
 
 NCFRESULT QTParameters::ParamValue(const GUID& parameter, IParameterValue* value) {
-    return InterfaceEntry([&]() -> NCFRESULT {
+    return ResultOf([&]() -> NCFRESULT {
         if (!inComponent_ || !inSet_ || !clipParams_) {
             return NCF_OK;
         }

@@ -3,8 +3,6 @@
 
 #include "source/parameters/model/NMAParamInfos.h"
 
-#include "source/parameters/model/ParamItems.h"
-#include "source/parameters/model/ParamVocabulary.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::XMLUtils {
@@ -33,20 +31,9 @@ void ReadTexts(NMAXmlElement& external, NMAString& outShortName, NMAString& outD
 
 }  // namespace
 
-NMAParamInfos::~NMAParamInfos() = default;
-
 NCFRESULT NMAParamInfos::GetVersion(NMAString& out) const {
     GetParamText(Element(), kParamVersion, out);
     return NCF_OK;
-}
-
-NCFRESULT NMAParamInfos::SetVersion(const NMAString& text) {
-    SetParamText(Element(), kParamVersion, text);
-    return NCF_OK;
-}
-
-ncfUInt32 NMAParamInfos::GetExternalCount() const {
-    return CountParamItems(Element(), kParamExternal);
 }
 
 NCFRESULT NMAParamInfos::GetExternalAt(ncfUInt32 index, NMAString& outExtension,
@@ -82,14 +69,6 @@ NCFRESULT NMAParamInfos::RemoveExternal(const NMAString& extension) {
     return NCF_OK;
 }
 
-ncfUInt32 NMAParamInfos::GetParameterCount() const {
-    return CountParamItems(Element(), kParamItem);
-}
-
-NCFRESULT NMAParamInfos::GetParameterAt(ncfUInt32 index, NMAParamInfoParam& out) const {
-    return FillParam(out, GetParamItemAt(Element(), kParamItem, index));
-}
-
 NCFRESULT NMAParamInfos::GetParameter(const GUID& id, NMAParamInfoParam& out) const {
     const ParamKey key = ParamIdKey(id);
     NMAXmlElement* found = FindParamItem(Element(), kParamItem, key);
@@ -101,36 +80,6 @@ NCFRESULT NMAParamInfos::GetParameter(const GUID& id, NMAParamInfoParam& out) co
         }
     }
     return found ? FillParam(out, found) : NMA_E_NODATA;
-}
-
-NCFRESULT NMAParamInfos::AddParameter(const GUID& id, NMAParamInfoParam& out) {
-    return FillParam(out, AddParamItem(Element(), kParamItem, ParamIdKey(id)));
-}
-
-NCFRESULT NMAParamInfos::RemoveParameter(const GUID& id) {
-    RemoveParamItem(Element(), kParamItem, ParamIdKey(id));
-    return NCF_OK;
-}
-
-ncfUInt32 NMAParamInfos::GetGroupCount() const {
-    return CountParamItems(Element(), kParamGroupItem);
-}
-
-NCFRESULT NMAParamInfos::GetGroupAt(ncfUInt32 index, NMAParamInfoGroup& out) const {
-    return FillParam(out, GetParamItemAt(Element(), kParamGroupItem, index));
-}
-
-NCFRESULT NMAParamInfos::GetGroup(const GUID& id, NMAParamInfoGroup& out) const {
-    return FillParam(out, GetParamItem(Element(), kParamGroupItem, ParamIdKey(id)));
-}
-
-NCFRESULT NMAParamInfos::AddGroup(const GUID& id, NMAParamInfoGroup& out) {
-    return FillParam(out, AddParamItem(Element(), kParamGroupItem, ParamIdKey(id)));
-}
-
-NCFRESULT NMAParamInfos::RemoveGroup(const GUID& id) {
-    RemoveParamItem(Element(), kParamGroupItem, ParamIdKey(id));
-    return NCF_OK;
 }
 
 }  // namespace NMA::XMLUtils

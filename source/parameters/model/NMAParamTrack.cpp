@@ -3,22 +3,7 @@
 
 #include "source/parameters/model/NMAParamTrack.h"
 
-#include "source/parameters/model/ParamItems.h"
-#include "source/parameters/model/ParamText.h"
-#include "source/parameters/model/ParamVocabulary.h"
-
 namespace NMA::XMLUtils {
-
-NMAParamTrack::~NMAParamTrack() = default;
-
-NCFRESULT NMAParamTrack::GetNumber(ncfUInt32& out) const {
-    ParamText::Read(GetParamAttribute(Element(), kParamNumber), out);
-    return NCF_OK;
-}
-
-NCFRESULT NMAParamTrack::GetParameterInfos(NMAParamInfos& out) const {
-    return FillParam(out, GetParamItemAt(Element(), kParamInfos, 0));
-}
 
 NCFRESULT NMAParamTrack::GetActiveSet(GUID& out) const {
     NMAString text;
@@ -27,33 +12,11 @@ NCFRESULT NMAParamTrack::GetActiveSet(GUID& out) const {
     return NCF_OK;
 }
 
-NCFRESULT NMAParamTrack::SetActiveSet(const GUID& id) {
-    SetParamText(Element(), kParamActiveSet, ParamText::Write(id));
-    return NCF_OK;
-}
-
-ncfUInt32 NMAParamTrack::GetParameterSetCount() const {
-    return CountParamItems(Element(), kParamSetItem);
-}
-
-NCFRESULT NMAParamTrack::GetParameterSetAt(ncfUInt32 index, NMAParamSet& out) const {
-    return FillParam(out, GetParamItemAt(Element(), kParamSetItem, index));
-}
-
-NCFRESULT NMAParamTrack::GetParameterSet(const GUID& id, NMAParamSet& out) const {
-    return FillParam(out, GetParamItem(Element(), kParamSetItem, ParamIdKey(id)));
-}
-
 // The id serves to refuse a second set of that id; writing it is left to the
 // caller, and the host relies on a new set being without one.
 NCFRESULT NMAParamTrack::AddParameterSet(const GUID& id, NMAParamSet& out) {
     RequireFreeParamKey(Element(), kParamSetItem, ParamIdKey(id));
     return FillParam(out, AddParamElement(Element(), kParamSetItem));
-}
-
-NCFRESULT NMAParamTrack::RemoveParameterSet(const GUID& id) {
-    RemoveParamItem(Element(), kParamSetItem, ParamIdKey(id));
-    return NCF_OK;
 }
 
 }  // namespace NMA::XMLUtils

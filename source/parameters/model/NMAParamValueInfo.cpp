@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 
 // The kind of a value, and the choices of the kinds that have a list or words.
-// The kinds with a range stand in NMAParamValueInfoRanges.cpp.
 
 #include "source/parameters/model/NMAParamValueInfo.h"
 
@@ -35,8 +34,6 @@ ncfUInt32 ReadNumber(NMAXmlElement& element, const char* attribute) {
 }
 
 }  // namespace
-
-NMAParamValueInfo::~NMAParamValueInfo() = default;
 
 NMAXmlElement& NMAParamValueInfo::infoElement(NMAParamKind kind) const {
     NMAXmlElement* const found = Element().FindChild(NMAString(kParamKindNames[kind].info), 0);

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "source/parameters/model/NMAParamElement.h"
+#include "source/parameters/model/ParamItems.h"
 #include "source/parameters/model/ParamText.h"
 #include "source/parameters/model/ParamVocabulary.h"
 
@@ -12,36 +13,74 @@ namespace NMA::XMLUtils {
 // NCF_E_UNEXPECTED. Opaque values and labels pass through untouched.
 class NMAParameter : public NMAParamElement {
 public:
-    ~NMAParameter() override;
+    NCFRESULT GetID(GUID& out) const {
+        out = GetParamId(Element());
+        return NCF_OK;
+    }
+    bool IsSilent() const { return GetParamFlag(Element(), kParamSilent); }
+    NCFRESULT SetSilent(bool silent) {
+        SetParamFlag(Element(), kParamSilent, silent);
+        return NCF_OK;
+    }
 
-    NCFRESULT GetID(GUID& out) const;
-    bool IsSilent() const;
-    NCFRESULT SetSilent(bool silent);
-
-    NCFRESULT GetSInt32(ncfSInt32& out) const;
-    NCFRESULT SetSInt32(ncfSInt32 value);
+    NCFRESULT GetSInt32(ncfSInt32& out) const { return read(valueElement(kParamKindSInt32), out); }
+    NCFRESULT SetSInt32(ncfSInt32 value) {
+        return write(valueElement(kParamKindSInt32), ParamText::Write(value));
+    }
     // Discrete values too.
-    NCFRESULT GetUInt32(ncfUInt32& out) const;
-    NCFRESULT SetUInt32(ncfUInt32 value);
-    NCFRESULT GetSInt64(ncfSInt64& out) const;
-    NCFRESULT SetSInt64(ncfSInt64 value);
-    NCFRESULT GetUInt64(ncfUInt64& out) const;
-    NCFRESULT SetUInt64(ncfUInt64 value);
+    NCFRESULT GetUInt32(ncfUInt32& out) const { return read(uint32Element(), out); }
+    NCFRESULT SetUInt32(ncfUInt32 value) { return write(uint32Element(), ParamText::Write(value)); }
+    NCFRESULT GetSInt64(ncfSInt64& out) const { return read(valueElement(kParamKindSInt64), out); }
+    NCFRESULT SetSInt64(ncfSInt64 value) {
+        return write(valueElement(kParamKindSInt64), ParamText::Write(value));
+    }
+    NCFRESULT GetUInt64(ncfUInt64& out) const { return read(valueElement(kParamKindUInt64), out); }
+    NCFRESULT SetUInt64(ncfUInt64 value) {
+        return write(valueElement(kParamKindUInt64), ParamText::Write(value));
+    }
     // What is read is not what was set: see ParamText.
-    NCFRESULT GetDouble(double& out) const;
-    NCFRESULT SetDouble(double value);
-    NCFRESULT GetRational(NMAParamRational& out) const;
-    NCFRESULT SetRational(const NMAParamRational& value);
-    NCFRESULT GetBoolean(bool& out) const;
-    NCFRESULT SetBoolean(bool value);
-    NCFRESULT GetString(NMAString& out) const;
-    NCFRESULT SetString(const NMAString& value);
+    NCFRESULT GetDouble(double& out) const { return read(valueElement(kParamKindDouble), out); }
+    NCFRESULT SetDouble(double value) {
+        return write(valueElement(kParamKindDouble), ParamText::Write(value));
+    }
+    NCFRESULT GetRational(NMAParamRational& out) const {
+        return read(valueElement(kParamKindRational), out);
+    }
+    NCFRESULT SetRational(const NMAParamRational& value) {
+        return write(valueElement(kParamKindRational), ParamText::Write(value));
+    }
+    NCFRESULT GetBoolean(bool& out) const {
+        out = ParamText::IsTrue(textOf(valueElement(kParamKindBoolean)));
+        return NCF_OK;
+    }
+    NCFRESULT SetBoolean(bool value) {
+        return write(valueElement(kParamKindBoolean), ParamText::WriteFlag(value));
+    }
+    NCFRESULT GetString(NMAString& out) const {
+        valueElement(kParamKindString).GetText(out);
+        return NCF_OK;
+    }
+    NCFRESULT SetString(const NMAString& value) {
+        return write(valueElement(kParamKindString), value);
+    }
 
 private:
     NMAXmlElement& valueElement(NMAParamKind kind) const;
     NMAXmlElement& uint32Element() const;
+    static NMAString textOf(NMAXmlElement& element) {
+        NMAString text;
+        element.GetText(text);
+        return text;
+    }
     template <class Value>
-    static NCFRESULT read(NMAXmlElement& element, Value& out);
+    static NCFRESULT read(NMAXmlElement& element, Value& out) {
+        ParamText::Read(textOf(element), out);
+        return NCF_OK;
+    }
+    static NCFRESULT write(NMAXmlElement& element, const NMAString& text) {
+        element.SetText(text);
+        return NCF_OK;
+    }
 };
 
 }  // namespace NMA::XMLUtils

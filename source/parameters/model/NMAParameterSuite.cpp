@@ -3,8 +3,6 @@
 
 #include "source/parameters/model/NMAParameterSuite.h"
 
-#include "source/parameters/model/ParamItems.h"
-#include "source/parameters/model/ParamVocabulary.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::XMLUtils {
@@ -16,27 +14,6 @@ NMAXmlElement& NMAParameterSuite::root() const {
         ThrowIfFailed(NMA_E_NOTINITIALIZED);
     }
     return *GetRoot();
-}
-
-ncfUInt32 NMAParameterSuite::GetComponentCount() const {
-    return CountParamItems(root(), kParamComponent);
-}
-
-NCFRESULT NMAParameterSuite::GetComponentAt(ncfUInt32 index, NMAParamComponent& out) const {
-    return FillParam(out, GetParamItemAt(root(), kParamComponent, index));
-}
-
-NCFRESULT NMAParameterSuite::GetComponent(const GUID& id, NMAParamComponent& out) const {
-    return FillParam(out, GetParamItem(root(), kParamComponent, ParamIdKey(id)));
-}
-
-NCFRESULT NMAParameterSuite::AddComponent(const GUID& id, NMAParamComponent& out) {
-    return FillParam(out, AddParamItem(root(), kParamComponent, ParamIdKey(id)));
-}
-
-NCFRESULT NMAParameterSuite::RemoveComponent(const GUID& id) {
-    RemoveParamItem(root(), kParamComponent, ParamIdKey(id));
-    return NCF_OK;
 }
 
 }  // namespace NMA::XMLUtils

@@ -3,6 +3,8 @@
 #pragma once
 
 #include "source/parameters/model/NMAParamComponent.h"
+#include "source/parameters/model/ParamItems.h"
+#include "source/parameters/model/ParamVocabulary.h"
 #include "source/parameters/xml/NMAXmlDoc.h"
 
 namespace NMA::XMLUtils {
@@ -15,11 +17,20 @@ public:
     using NMAXmlDoc::NMAXmlDoc;
     ~NMAParameterSuite() override;
 
-    ncfUInt32 GetComponentCount() const;
-    NCFRESULT GetComponentAt(ncfUInt32 index, NMAParamComponent& out) const;
-    NCFRESULT GetComponent(const GUID& id, NMAParamComponent& out) const;
-    NCFRESULT AddComponent(const GUID& id, NMAParamComponent& out);
-    NCFRESULT RemoveComponent(const GUID& id);
+    ncfUInt32 GetComponentCount() const { return CountParamItems(root(), kParamComponent); }
+    NCFRESULT GetComponentAt(ncfUInt32 index, NMAParamComponent& out) const {
+        return FillParam(out, GetParamItemAt(root(), kParamComponent, index));
+    }
+    NCFRESULT GetComponent(const GUID& id, NMAParamComponent& out) const {
+        return FillParam(out, GetParamItem(root(), kParamComponent, ParamIdKey(id)));
+    }
+    NCFRESULT AddComponent(const GUID& id, NMAParamComponent& out) {
+        return FillParam(out, AddParamItem(root(), kParamComponent, ParamIdKey(id)));
+    }
+    NCFRESULT RemoveComponent(const GUID& id) {
+        RemoveParamItem(root(), kParamComponent, ParamIdKey(id));
+        return NCF_OK;
+    }
 
 private:
     NMAXmlElement& root() const;

@@ -1,9 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// The two documents of a visitor. Access to values stands in
-// NMAParametersVisitorValues.cpp.
-
 #include "source/parameters/model/NMAParametersVisitor.h"
 
 #include "source/plugin/ResultChecks.h"
@@ -101,6 +98,14 @@ ncfBool NMAParametersVisitor::HasParameterSet(const GUID& component, ncfUInt32 t
                        itsComponent.GetTrack(track, itsTrack) >= 0 &&
                        itsTrack.GetParameterSet(set, itsSet) >= 0;
     return found ? 1 : 0;
+}
+
+NMAParameter NMAParametersVisitor::open(const GUID& component, ncfUInt32 track, const GUID& set,
+                                        const GUID& parameter) {
+    BeginUpdate();
+    NMAParameter found;
+    FindParameter(component, track, set, parameter, found);
+    return found;
 }
 
 }  // namespace NMA::XMLUtils

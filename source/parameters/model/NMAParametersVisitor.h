@@ -41,39 +41,79 @@ public:
 
     // The document for update is fetched and stays for the next call.
     NCFRESULT GetUInt32(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfUInt32& out);
+                        const GUID& parameter, ncfUInt32& out) {
+        return open(component, track, set, parameter).GetUInt32(out);
+    }
     NCFRESULT GetSInt32(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfSInt32& out);
+                        const GUID& parameter, ncfSInt32& out) {
+        return open(component, track, set, parameter).GetSInt32(out);
+    }
     NCFRESULT GetUInt64(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfUInt64& out);
+                        const GUID& parameter, ncfUInt64& out) {
+        return open(component, track, set, parameter).GetUInt64(out);
+    }
     NCFRESULT GetSInt64(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfSInt64& out);
+                        const GUID& parameter, ncfSInt64& out) {
+        return open(component, track, set, parameter).GetSInt64(out);
+    }
     NCFRESULT GetDouble(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, double& out);
+                        const GUID& parameter, double& out) {
+        return open(component, track, set, parameter).GetDouble(out);
+    }
     NCFRESULT GetRational(const GUID& component, ncfUInt32 track, const GUID& set,
-                          const GUID& parameter, NMAParamRational& out);
+                          const GUID& parameter, NMAParamRational& out) {
+        return open(component, track, set, parameter).GetRational(out);
+    }
     NCFRESULT GetString(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, NMAString& out);
+                        const GUID& parameter, NMAString& out) {
+        return open(component, track, set, parameter).GetString(out);
+    }
     NCFRESULT GetBoolean(const GUID& component, ncfUInt32 track, const GUID& set,
-                         const GUID& parameter, bool& out);
+                         const GUID& parameter, bool& out) {
+        return open(component, track, set, parameter).GetBoolean(out);
+    }
 
     // Each hands the whole document back.
     NCFRESULT SetUInt32(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfUInt32 value);
+                        const GUID& parameter, ncfUInt32 value) {
+        open(component, track, set, parameter).SetUInt32(value);
+        return EndUpdate();
+    }
     NCFRESULT SetSInt32(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfSInt32 value);
+                        const GUID& parameter, ncfSInt32 value) {
+        open(component, track, set, parameter).SetSInt32(value);
+        return EndUpdate();
+    }
     NCFRESULT SetUInt64(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfUInt64 value);
+                        const GUID& parameter, ncfUInt64 value) {
+        open(component, track, set, parameter).SetUInt64(value);
+        return EndUpdate();
+    }
     NCFRESULT SetSInt64(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, ncfSInt64 value);
+                        const GUID& parameter, ncfSInt64 value) {
+        open(component, track, set, parameter).SetSInt64(value);
+        return EndUpdate();
+    }
     NCFRESULT SetDouble(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, double value);
+                        const GUID& parameter, double value) {
+        open(component, track, set, parameter).SetDouble(value);
+        return EndUpdate();
+    }
     NCFRESULT SetRational(const GUID& component, ncfUInt32 track, const GUID& set,
-                          const GUID& parameter, const NMAParamRational& value);
+                          const GUID& parameter, const NMAParamRational& value) {
+        open(component, track, set, parameter).SetRational(value);
+        return EndUpdate();
+    }
     NCFRESULT SetString(const GUID& component, ncfUInt32 track, const GUID& set,
-                        const GUID& parameter, const NMAString& value);
+                        const GUID& parameter, const NMAString& value) {
+        open(component, track, set, parameter).SetString(value);
+        return EndUpdate();
+    }
     NCFRESULT SetBoolean(const GUID& component, ncfUInt32 track, const GUID& set,
-                         const GUID& parameter, bool value);
+                         const GUID& parameter, bool value) {
+        open(component, track, set, parameter).SetBoolean(value);
+        return EndUpdate();
+    }
 
 private:
     using GetText = NCFRESULT (INCFParametersXML::*)(INCFString*);

@@ -136,22 +136,6 @@ bool IsTrue(const NMAString& text) {
     return std::strcmp(text.GetUTF8String(), kTrue) == 0;
 }
 
-NMAString Write(ncfSInt32 value) {
-    return NMAString(std::to_string(value).c_str());
-}
-
-NMAString Write(ncfUInt32 value) {
-    return NMAString(std::to_string(value).c_str());
-}
-
-NMAString Write(ncfSInt64 value) {
-    return NMAString(std::to_string(value).c_str());
-}
-
-NMAString Write(ncfUInt64 value) {
-    return NMAString(std::to_string(value).c_str());
-}
-
 // Six places behind a point, whatever the locale of the process.
 NMAString Write(double value) {
     char digits[384];  // the largest double has 309 places before the point

@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <string>
+#include <type_traits>
+
 #include "host_interfaces/framework/Guid.h"
 #include "host_interfaces/util/NMAString.h"
 
@@ -31,10 +34,10 @@ void Read(const NMAString& text, GUID& out);
 // The whole text must be "true"; anything else is false, never a failure.
 bool IsTrue(const NMAString& text);
 
-NMAString Write(ncfSInt32 value);
-NMAString Write(ncfUInt32 value);
-NMAString Write(ncfSInt64 value);
-NMAString Write(ncfUInt64 value);
+template <class Whole, class = std::enable_if_t<std::is_integral_v<Whole>>>
+NMAString Write(Whole value) {
+    return NMAString(std::to_string(value).c_str());
+}
 NMAString Write(double value);
 NMAString Write(const NMAParamRational& value);
 NMAString Write(const GUID& value);

@@ -9,12 +9,12 @@
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/descriptor_data/QuickTimeToAAFInfoRetriever.h"
 #include "source/plugin/CNCFClassFactory.h"
-#include "source/plugin/InterfaceEntry.h"
 #include "source/plugin/NCFSmartPtr.h"
 #include "source/plugin/PluginFolder.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/ResultOf.h"
 #include "source/plugin/entry/ComponentTable.h"
 #include "source/plugin/os/Os.h"
 
@@ -55,7 +55,7 @@ void SetNumber(const Pointer& definition, const NumberAttribute& attribute) {
 // A body that throws or succeeds.
 template <class Body>
 NCFRESULT Guarded(Body body) {
-    return NMA::Impl::InterfaceEntry([&] {
+    return NMA::Impl::ResultOf([&] {
         body();
         return NCF_OK;
     });

@@ -8,10 +8,11 @@
 
 namespace NMA::Impl {
 
-// Body of an operation that the host calls: what it throws becomes its result,
-// so that no exception crosses the interface.
+// Runs a body that throws its failures. A thrown code is the result; anything else is
+// unexpected, such as the texts that AAF's look-ups and counted pointers throw. The body
+// of an operation that the host calls stands in here: no exception crosses an interface.
 template <class Body>
-NCFRESULT InterfaceEntry(Body&& body) {
+NCFRESULT ResultOf(Body&& body) {
     try {
         return std::forward<Body>(body)();
     } catch (NCFRESULT failure) {
