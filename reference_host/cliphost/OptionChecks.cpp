@@ -4,12 +4,12 @@
 
 #include <fmt/format.h>
 
-#include <charconv>
 #include <filesystem>
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/FileUrl.h"
+#include "reference_host/util/text/Number.h"
 
 namespace cliphost {
 namespace {
@@ -17,13 +17,6 @@ namespace {
 // Slower, a frame outlasts what a timecode counts; faster, no camera is.
 constexpr double kSlowest = 0.01;
 constexpr double kFastest = 10000.0;
-
-template <class Number>
-bool ReadWhole(const std::string& text, Number& number) {
-    const char* const end = text.data() + text.size();
-    const auto read = std::from_chars(text.data(), end, number);
-    return read.ec == std::errc() && read.ptr == end;
-}
 
 // Each option of the program and of its verbs that takes a value.
 template <class Action>
@@ -45,7 +38,7 @@ CLI::Validator WholeNumber(std::uint64_t least, std::uint64_t most) {
     return CLI::Validator(
         [least, most](std::string& text) {
             std::uint64_t number = 0;
-            return ReadWhole(text, number) && number >= least && number <= most
+            return host::text::ReadNumber(text, number) && number >= least && number <= most
                        ? std::string()
                        : fmt::format("'{}' is no whole number from {} to {}", text, least, most);
         },
@@ -61,7 +54,7 @@ CLI::Validator FrameRate() {
         [](std::string& text) {
             double rate = 0.0;
             // What is no number is not within the bounds either.
-            return ReadWhole(text, rate) && rate >= kSlowest && rate <= kFastest
+            return host::text::ReadNumber(text, rate) && rate >= kSlowest && rate <= kFastest
                        ? std::string()
                        : fmt::format(
                              "'{}' is no number of frames a second from {} to {}; write "
