@@ -6,7 +6,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <charconv>
 
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/media/SampleMapping.h"
@@ -17,6 +16,7 @@
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/HostText.h"
+#include "reference_host/util/text/Number.h"
 
 namespace cliphost {
 namespace {
@@ -83,8 +83,7 @@ ncfUInt32 FindValue(const host::ParameterInfo& info, const std::string& text) {
         return found[0];
     }
     ncfUInt32 number = 0;
-    const auto end = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (!text.empty() && end.ec == std::errc() && end.ptr == text.data() + text.size()) {
+    if (host::text::ReadNumber(text, number)) {
         return number;
     }
     throw Failure(kExitCaller, fmt::format("--set {}={}", info.name, text),

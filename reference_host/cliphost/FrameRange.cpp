@@ -5,19 +5,15 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <charconv>
 #include <limits>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/util/text/Number.h"
 
 namespace cliphost {
 namespace {
 
-bool ParseNumber(const std::string& text, std::uint64_t& number) {
-    const char* const end = text.data() + text.size();
-    const auto read = std::from_chars(text.data(), end, number);
-    return read.ec == std::errc() && read.ptr == end;
-}
+using host::text::ReadNumber;
 
 std::vector<std::string> Split(const std::string& text) {
     std::vector<std::string> parts(1);
@@ -53,9 +49,9 @@ FrameRange ParseFrameRange(const std::string& text) {
     std::uint64_t end = 0;
     const bool hasEnd = parts.size() >= 2 && !parts[1].empty();
     const bool isGood = (parts.size() == 2 || parts.size() == 3) &&
-                        (parts[0].empty() || ParseNumber(parts[0], range.first)) &&
-                        (!hasEnd || ParseNumber(parts[1], end)) &&
-                        (parts.size() < 3 || ParseNumber(parts[2], range.step)) && range.step > 0;
+                        (parts[0].empty() || ReadNumber(parts[0], range.first)) &&
+                        (!hasEnd || ReadNumber(parts[1], end)) &&
+                        (parts.size() < 3 || ReadNumber(parts[2], range.step)) && range.step > 0;
     if (!isGood || (hasEnd && end <= range.first)) {
         throw Failure(kExitCaller, "--range " + text, "this is not a range",
                       "write FIRST:END or FIRST:END:STEP, such as 0:25 for frames 0 to 24, or 100: "

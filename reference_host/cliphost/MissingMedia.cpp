@@ -2,30 +2,22 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/MissingMedia.h"
 
+#include "reference_host/cliphost/HeaderTracks.h"
 #include "reference_host/cliphost/MissingSamples.h"
 
 namespace cliphost {
-namespace {
-
-using header_parser::Track;
-
-}  // namespace
 
 MissingSound::MissingSound(const std::filesystem::path& movie, std::size_t place, unsigned rate)
     : header_(header_parser::InspectHeaders(movie)), rate_(rate) {
-    if (!header_.movie || rate == 0) {
+    const FoundTrack found = Find(header_, {TrackKind::Sound, place});
+    if (!found.track || rate == 0) {
         return;
     }
-    const auto& sounds = header_.movie->Of(header_parser::TrackKind::kSound);
-    if (place >= sounds.size()) {
-        return;
-    }
-    const Track& track = header_.movie->tracks[sounds[place]];
-    const MissingSamples missing(header_, sounds[place]);
-    if (const auto first = missing.Rest(); first && track.mediaTimeScale > 0) {
-        track_ = &track;
+    const MissingSamples missing(header_, found.place);
+    if (const auto first = missing.Rest(); first && found.track->mediaTimeScale > 0) {
+        track_ = found.track;
         reason_ = missing.Sentence();
-        mediaTime_ = static_cast<double>(track.samples.Times().DecodeTimeOf(*first));
+        mediaTime_ = static_cast<double>(track_->samples.Times().DecodeTimeOf(*first));
     }
 }
 

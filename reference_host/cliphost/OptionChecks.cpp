@@ -4,12 +4,12 @@
 
 #include <fmt/format.h>
 
-#include <charconv>
 #include <filesystem>
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/FileUrl.h"
+#include "reference_host/util/text/Number.h"
 
 namespace cliphost {
 namespace {
@@ -18,13 +18,6 @@ namespace {
 // has a higher one.
 constexpr double kSlowest = 0.01;
 constexpr double kFastest = 10000.0;
-
-template <class Number>
-bool ReadWhole(const std::string& text, Number& number) {
-    const char* const end = text.data() + text.size();
-    const auto read = std::from_chars(text.data(), end, number);
-    return read.ec == std::errc() && read.ptr == end;
-}
 
 // Each option of the program and of its verbs that takes a value.
 template <class Action>
@@ -46,7 +39,7 @@ CLI::Validator WholeNumber(std::uint64_t least, std::uint64_t most) {
     return CLI::Validator(
         [least, most](std::string& text) {
             std::uint64_t number = 0;
-            return ReadWhole(text, number) && number >= least && number <= most
+            return host::text::ReadNumber(text, number) && number >= least && number <= most
                        ? std::string()
                        : fmt::format("'{}' is not a whole number from {} to {}", text, least, most);
         },
@@ -62,7 +55,7 @@ CLI::Validator FrameRate() {
         [](std::string& text) {
             double rate = 0.0;
             // What is no number is not within the bounds either.
-            return ReadWhole(text, rate) && rate >= kSlowest && rate <= kFastest
+            return host::text::ReadNumber(text, rate) && rate >= kSlowest && rate <= kFastest
                        ? std::string()
                        : fmt::format(
                              "'{}' is not a number of frames a second from {} to {}; write "

@@ -123,10 +123,8 @@ std::string WhyNotShown(const std::filesystem::path& movie, const WhichTrack& wh
 
 std::string WhatPictureLacks(const std::filesystem::path& movie, std::size_t place) {
     const HeaderReport header = header_parser::InspectHeaders(movie);
-    if (!header.movie || place >= TracksOf(header, TrackKind::Picture).size()) {
-        return {};
-    }
-    return MissingSamples(header, TracksOf(header, TrackKind::Picture)[place]).Sentence();
+    const FoundTrack found = Find(header, {TrackKind::Picture, place});
+    return found.track ? MissingSamples(header, found.place).Sentence() : std::string();
 }
 
 std::string WhatLiesElsewhere(const std::filesystem::path& movie, const WhichTrack& which) {

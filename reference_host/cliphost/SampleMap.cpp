@@ -6,8 +6,12 @@
 
 #include <algorithm>
 
+#include "reference_host/framework/Guard.h"
+
 namespace cliphost {
 namespace {
+
+using host::Check;
 
 struct Property {
     std::uint64_t value;
@@ -38,16 +42,12 @@ struct Stored {
     }
 };
 
-NCFRESULT ReadStored(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t sample,
-                     Stored& stored) {
+Stored ReadStored(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t sample) {
     ncfUInt64 size = 0;  // the low half is written
     ncfUInt64 position = 0;
-    NCFRESULT result = map.GetSampleSize(track, sample, &size);
-    if (result >= 0) {
-        result = map.GetSamplePosition(track, sample, &position);
-    }
-    stored = {position, size};
-    return result;
+    Check(map.GetSampleSize(track, sample, &size));
+    Check(map.GetSamplePosition(track, sample, &position));
+    return {position, size};
 }
 
 // Adds up the samples of a run, the first of the `samples` that are left to measure,
@@ -57,80 +57,54 @@ public:
     RunMeasure(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t samples, SampleRun& run)
         : map_(map), track_(track), left_(samples - run.first), run_(run) {}
 
-    // `sum`: the bytes of the packets.
-    NCFRESULT Run(std::uint64_t& sum) {
-        NCFRESULT result = Read(0, first_);
-        bool isEven = false;
-        if (result >= 0) {
-            result = MeasureEvenPackets(isEven);
-        }
-        if (result < 0 || isEven) {
-            sum = run_.bytes;
-            return result;
-        }
-        return MeasureEachSample(sum);
+    // Gives the bytes of the packets.
+    std::uint64_t Run() {
+        first_ = Read(0);
+        return ArePacketsEven() ? run_.bytes : MeasureEachSample();
     }
 
 private:
-    NCFRESULT Read(std::uint64_t sample, Stored& stored) {
-        return ReadStored(map_, track_, run_.first + sample, stored);
-    }
+    Stored Read(std::uint64_t sample) { return ReadStored(map_, track_, run_.first + sample); }
 
     // How many samples the first packet holds, in steps that grow and then halve.
-    NCFRESULT CountInFirstPacket(std::uint64_t& count) {
+    std::uint64_t CountInFirstPacket() {
         std::uint64_t inside = 0, outside = left_;
         for (std::uint64_t step = 1; inside + 1 < outside;) {
             const bool isGrowing = step > 0 && step < outside - inside;
             const std::uint64_t at = isGrowing ? inside + step : inside + (outside - inside) / 2;
-            Stored stored;
-            const NCFRESULT result = Read(at, stored);
-            if (result < 0) {
-                return result;
-            }
-            const bool isInside = stored.SharesPacketWith(first_);
+            const bool isInside = Read(at).SharesPacketWith(first_);
             (isInside ? inside : outside) = at;
             step = isGrowing && isInside ? step * 2 : 0;
         }
-        count = inside + 1;
-        return NCF_OK;
+        return inside + 1;
     }
 
     // Packets that all have one size and hold equally many samples, as those of
     // PCM, need not be asked one by one.
-    NCFRESULT MeasureEvenPackets(bool& isEven) {
+    bool ArePacketsEven() {
         if (first_.size == 0 || run_.bytes == 0 || run_.bytes % first_.size != 0) {
-            return NCF_OK;
+            return false;
         }
         const std::uint64_t packets = run_.bytes / first_.size;
-        std::uint64_t inPacket = 1;
-        NCFRESULT result = CountInFirstPacket(inPacket);
-        if (result < 0 || packets - 1 > (left_ - 1) / inPacket) {
-            return result;
+        const std::uint64_t inPacket = CountInFirstPacket();
+        if (packets - 1 > (left_ - 1) / inPacket) {
+            return false;
         }
         const std::uint64_t begin = (packets - 1) * inPacket;  // of the last packet
         const std::uint64_t count = begin + std::min(inPacket, left_ - begin);
-        const Stored wanted{run_.position + (packets - 1) * first_.size, first_.size};
-        for (const std::uint64_t at : {begin, count - 1}) {
-            Stored stored;
-            result = Read(at, stored);
-            if (result < 0 || !stored.SharesPacketWith(wanted)) {
-                return result;
-            }
+        const Stored last{run_.position + (packets - 1) * first_.size, first_.size};
+        if (!Read(begin).SharesPacketWith(last) || !Read(count - 1).SharesPacketWith(last)) {
+            return false;
         }
-        isEven = true;
         run_.count = count;
-        return NCF_OK;
+        return true;
     }
 
-    NCFRESULT MeasureEachSample(std::uint64_t& sum) {
+    std::uint64_t MeasureEachSample() {
         Stored last = first_;
-        sum = first_.size;
+        std::uint64_t sum = first_.size;
         for (run_.count = 1; run_.count < left_; ++run_.count) {
-            Stored stored;
-            const NCFRESULT result = Read(run_.count, stored);
-            if (result < 0) {
-                return result;
-            }
+            const Stored stored = Read(run_.count);
             const bool isNew = !stored.SharesPacketWith(last);
             if (isNew && sum >= run_.bytes) {
                 break;
@@ -138,7 +112,7 @@ private:
             sum += isNew ? stored.size : 0;
             last = stored;
         }
-        return NCF_OK;
+        return sum;
     }
 
     NMA::ISampleMapping& map_;
@@ -148,37 +122,58 @@ private:
     Stored first_;
 };
 
+// Reads the run that begins with a sample, and tells what is wrong with it.
+SampleRun ReadRun(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t first,
+                  std::uint64_t fileSize, RunMap& found) {
+    SampleRun run{first, 0, 0, 0};
+    ncfUInt64 position = 0, bytes = 0;
+    Check(map.GetSamplePosition(track, first, &position));
+    Check(map.GetNumberOfContiguousBytes(track, first, &bytes));
+    run.position = position;
+    run.bytes = bytes;
+    const std::uint64_t sum = RunMeasure(map, track, found.samples, run).Run();
+    if (sum != run.bytes) {
+        Tell(found, fmt::format("from sample {} on {} bytes follow each other, but the sizes of "
+                                "the samples come to {}",
+                                first, run.bytes, sum));
+    }
+    if (run.position > fileSize || run.bytes > fileSize - run.position) {
+        Tell(found, fmt::format("{} at bytes {} to {}, and the file ends at {}",
+                                run.count == 1 ? fmt::format("sample {} lies", first)
+                                               : fmt::format("samples {} to {} lie", first,
+                                                             first + run.count - 1),
+                                run.position, run.position + run.bytes, fileSize));
+    }
+    found.bytes += sum;
+    return run;
+}
+
 }  // namespace
 
 NCFRESULT ReadMappedSample(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t number,
                            MappedSample& sample, TemporalOffsets* offsets) {
     sample = {};
     sample.number = number;
-    ncfUInt64 flags = 0, runBytes = 0;
-    ncfUInt32 dependencies = 0;
-    ncfSInt64 runSamples = 0;
-    Stored stored;
-    NCFRESULT result = ReadStored(map, track, number, stored);
+    const NCFRESULT result = host::Guarded([&] {
+        ncfUInt64 flags = 0, runBytes = 0;
+        ncfUInt32 dependencies = 0;
+        ncfSInt64 runSamples = 0;
+        const Stored stored = ReadStored(map, track, number);
+        Check(map.GetSampleProperties(track, number, &flags, &dependencies));
+        Check(map.GetNumberOfContiguousSamples(track, number, &runSamples));
+        Check(map.GetNumberOfContiguousBytes(track, number, &runBytes));
+        sample.position = stored.position;
+        sample.size = stored.size;
+        sample.properties = flags;
+        sample.dependencies = dependencies;
+        sample.contiguousSamples = runSamples;
+        sample.contiguousBytes = runBytes;
+        return NCF_OK;
+    });
     if (result >= 0) {
-        result = map.GetSampleProperties(track, number, &flags, &dependencies);
+        sample.temporalOffset = offsets ? offsets->Of(number) : AskOffset(map, track, number);
     }
-    if (result >= 0) {
-        result = map.GetNumberOfContiguousSamples(track, number, &runSamples);
-    }
-    if (result >= 0) {
-        result = map.GetNumberOfContiguousBytes(track, number, &runBytes);
-    }
-    if (result < 0) {
-        return result;
-    }
-    sample.position = stored.position;
-    sample.size = stored.size;
-    sample.properties = flags;
-    sample.dependencies = dependencies;
-    sample.contiguousSamples = runSamples;
-    sample.contiguousBytes = runBytes;
-    sample.temporalOffset = offsets ? offsets->Of(number) : AskOffset(map, track, number);
-    return NCF_OK;
+    return result;
 }
 
 std::string WordsForProperties(std::uint64_t properties) {
@@ -192,43 +187,16 @@ std::string WordsForProperties(std::uint64_t properties) {
 
 RunMap ReadRuns(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t fileSize) {
     RunMap found;
-    ncfUInt64 samples = 0;
-    found.result = map.GetNumberOfSamples(track, &samples);
-    found.samples = samples;
-    std::uint64_t next = 0;
-    while (found.result >= 0 && next < found.samples) {
-        SampleRun run{next, 0, 0, 0};
-        ncfUInt64 position = 0, bytes = 0;
-        std::uint64_t sum = 0;
-        found.result = map.GetSamplePosition(track, next, &position);
-        if (found.result >= 0) {
-            found.result = map.GetNumberOfContiguousBytes(track, next, &bytes);
+    found.result = host::Guarded([&] {
+        ncfUInt64 samples = 0;
+        const NCFRESULT counted = map.GetNumberOfSamples(track, &samples);
+        found.samples = samples;
+        Check(counted);
+        for (std::uint64_t next = 0; next < found.samples; next += found.runs.back().count) {
+            found.runs.push_back(ReadRun(map, track, next, fileSize, found));
         }
-        run.position = position;
-        run.bytes = bytes;
-        if (found.result >= 0) {
-            found.result = RunMeasure(map, track, found.samples, run).Run(sum);
-        }
-        if (found.result < 0) {
-            break;
-        }
-        if (sum != run.bytes) {
-            Tell(found,
-                 fmt::format("from sample {} on {} bytes follow each other, but the sizes of "
-                             "the samples come to {}",
-                             next, run.bytes, sum));
-        }
-        if (run.position > fileSize || run.bytes > fileSize - run.position) {
-            Tell(found, fmt::format("{} at bytes {} to {}, and the file ends at {}",
-                                    run.count == 1 ? fmt::format("sample {} lies", next)
-                                                   : fmt::format("samples {} to {} lie", next,
-                                                                 next + run.count - 1),
-                                    run.position, run.position + run.bytes, fileSize));
-        }
-        found.bytes += sum;
-        next += run.count;
-        found.runs.push_back(run);
-    }
+        return counted;
+    });
     return found;
 }
 

@@ -32,17 +32,17 @@ std::string SoundHint(const header_parser::HeaderReport& header) {
 SoundAlone SoundWithoutDescription(const std::filesystem::path& movie, std::size_t place) {
     const header_parser::HeaderReport header = header_parser::InspectHeaders(movie);
     SoundAlone sound;
-    if (!header.movie || place >= TracksOf(header, TrackKind::Sound).size()) {
+    const FoundTrack found = Find(header, {TrackKind::Sound, place});
+    if (!found.track) {
         return sound;
     }
-    const ncfUInt32 number = TracksOf(header, TrackKind::Sound)[place];
-    const header_parser::Track& track = header.movie->tracks[number];
+    const header_parser::Track& track = *found.track;
     sound.rate = track.sound.empty() ? 0 : static_cast<unsigned>(std::lround(track.sound[0].rate));
     if (CountsPackets(track)) {
         sound.problem = {movie,
                          fmt::format("track {} of the file: its packets hold several samples each, "
                                      "and only a description tells how many they are",
-                                     number + 1),
+                                     found.place + 1),
                          kTakeSoundOut, NCF_OK, route::kHeader};
     }
     return sound;

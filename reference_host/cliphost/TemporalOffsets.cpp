@@ -119,14 +119,13 @@ std::vector<std::size_t> SamplesToSearch(const std::vector<SampleTime>& times) {
     return samples;
 }
 
-std::vector<SampleTime> TimesInHeader(const header_parser::Movie& movie, const WhichTrack& which) {
-    const auto& tracks =
-        movie.Of(which.kind == TrackKind::Sound ? header_parser::TrackKind::kSound
-                                                : header_parser::TrackKind::kVideo);
-    if (which.place >= tracks.size()) {
+std::vector<SampleTime> TimesInHeader(const header_parser::HeaderReport& header,
+                                      const WhichTrack& which) {
+    const header_parser::Track* const track = Find(header, which).track;
+    if (!track) {
         return {};
     }
-    const header_parser::SampleTable& samples = movie.tracks[tracks[which.place]].samples;
+    const header_parser::SampleTable& samples = track->samples;
     std::vector<SampleTime> times;
     times.reserve(samples.Count());
     for (ncfUInt32 i = 0; i < samples.Count(); ++i) {
@@ -163,8 +162,9 @@ std::vector<SampleTime> TimesInLibrary(const std::filesystem::path& movie) {
 
 std::vector<SampleTime> DisplayTimesOf(const std::filesystem::path& movie,
                                        const WhichTrack& which) {
-    if (RouteOf(movie).reason.empty()) {
-        return TimesInHeader(*header_parser::InspectHeaders(movie).movie, which);
+    const header_parser::HeaderReport header = header_parser::InspectHeaders(movie);
+    if (RouteOf(header).reason.empty()) {
+        return TimesInHeader(header, which);
     }
     return which.kind == TrackKind::Sound ? std::vector<SampleTime>() : TimesInLibrary(movie);
 }

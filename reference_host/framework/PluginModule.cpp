@@ -14,21 +14,23 @@ namespace {
 // No module has as many; a count beyond it is a broken definition.
 constexpr ncfUInt32 kMostComponents = 4096;
 
-std::string InHex(NCFRESULT code) {
-    char text[16];
-    std::snprintf(text, sizeof(text), "0x%08X", static_cast<unsigned>(code));
-    return text;
+// Ends the loading where a function of the module failed.
+void CheckStep(NCFRESULT result, const std::string& what) {
+    if (result < 0) {
+        char code[16];
+        std::snprintf(code, sizeof(code), "0x%08X", static_cast<unsigned>(result));
+        throw LoadFailure{result, what + " with " + code};
+    }
 }
 
 template <class Function>
-bool FindFunction(const system::SharedLibrary& library, const char* name, Function& function,
-                  std::string& reason) {
+void FindFunction(const system::SharedLibrary& library, const char* name, Function& function) {
     function = reinterpret_cast<Function>(library.Find(name));
     if (function == nullptr) {
-        reason = std::string("it has no function ") + name +
-                 "; a plug-in module exports six functions of this framework";
+        throw LoadFailure{NCF_E_NOTSUPPORTED,
+                          std::string("it has no function ") + name +
+                              "; a plug-in module exports six functions of this framework"};
     }
-    return function != nullptr;
 }
 
 }  // namespace
@@ -41,19 +43,13 @@ std::unique_ptr<PluginModule> PluginModule::Load(const std::filesystem::path& fi
                                                  INCFUnknown& host, ComponentFactory& factory,
                                                  LoadFailure& failure) {
     std::unique_ptr<PluginModule> module(new PluginModule(file, host, factory));
-    std::string reason;
-    NCFRESULT result = module->Open(reason);
-    if (result >= 0) {
-        result = module->ReadPlugin(reason);
-    }
-    if (result >= 0) {
-        result = module->ReadComponents(reason);
-    }
-    if (result >= 0) {
-        result = module->Start(reason);
-    }
-    if (result < 0) {
-        failure = {result, DisplayPath(file) + ": can't load this module: " + reason};
+    try {
+        module->Open();
+        module->ReadPlugin();
+        module->ReadComponents();
+        module->Start();
+    } catch (const LoadFailure& why) {
+        failure = {why.code, DisplayPath(file) + ": can't load this module: " + why.message};
         return nullptr;
     }
     module->EnterComponents();
@@ -86,77 +82,54 @@ NCFRESULT PluginModule::Unload() {
     return NCF_OK;
 }
 
-NCFRESULT PluginModule::Open(std::string& reason) {
+void PluginModule::Open() {
+    std::string reason;
     if (!library_.Open(file_, reason)) {
-        return NCF_E_NOTFOUND;
+        throw LoadFailure{NCF_E_NOTFOUND, reason};
     }
-    const bool whole =
-        FindFunction(library_, "NCFRegisterPlugin", functions_.registerPlugin, reason) &&
-        FindFunction(library_, "NCFRegisterComponent", functions_.registerComponent, reason) &&
-        FindFunction(library_, "NCFGetClassFactory", functions_.getClassFactory, reason) &&
-        FindFunction(library_, "NCFCanUnloadNow", functions_.canUnloadNow, reason) &&
-        FindFunction(library_, "NCFStartup", functions_.startup, reason) &&
-        FindFunction(library_, "NCFShutdown", functions_.shutdown, reason);
-    return whole ? NCF_OK : NCF_E_NOTSUPPORTED;
+    FindFunction(library_, "NCFRegisterPlugin", functions_.registerPlugin);
+    FindFunction(library_, "NCFRegisterComponent", functions_.registerComponent);
+    FindFunction(library_, "NCFGetClassFactory", functions_.getClassFactory);
+    FindFunction(library_, "NCFCanUnloadNow", functions_.canUnloadNow);
+    FindFunction(library_, "NCFStartup", functions_.startup);
+    FindFunction(library_, "NCFShutdown", functions_.shutdown);
 }
 
-NCFRESULT PluginModule::ReadPlugin(std::string& reason) {
+void PluginModule::ReadPlugin() {
     Ref<INCFPluginDefinition> handed;
-    const NCFRESULT result = functions_.registerPlugin(host_.get(), handed.Out());
-    if (result < 0) {
-        reason = "NCFRegisterPlugin failed with " + InHex(result);
-        return result;
-    }
+    CheckStep(functions_.registerPlugin(host_.get(), handed.Out()), "NCFRegisterPlugin failed");
     // The module may only hand back an object that it had the host make.
     const auto* definition = dynamic_cast<const PluginDefinition*>(handed.get());
     if (definition == nullptr) {
-        reason = "NCFRegisterPlugin gave no definition object of this host";
-        return NCF_E_UNEXPECTED;
+        throw LoadFailure{NCF_E_UNEXPECTED,
+                          "NCFRegisterPlugin gave no definition object of this host"};
     }
     plugin_ = definition->facts();
     if (plugin_.componentCount > kMostComponents) {
-        reason = "it claims " + std::to_string(plugin_.componentCount) + " components";
-        return NCF_E_UNEXPECTED;
+        throw LoadFailure{NCF_E_UNEXPECTED,
+                          "it claims " + std::to_string(plugin_.componentCount) + " components"};
     }
-    return NCF_OK;
 }
 
-NCFRESULT PluginModule::ReadComponents(std::string& reason) {
+void PluginModule::ReadComponents() {
     for (ncfUInt32 index = 0; index < plugin_.componentCount; ++index) {
-        const NCFRESULT result = ReadComponent(index);
-        if (result < 0) {
-            reason = "NCFRegisterComponent failed for component " + std::to_string(index) +
-                     " with " + InHex(result);
-            return result;
-        }
+        Ref<INCFComponentDefinition> handed;
+        NCFRESULT result = functions_.registerComponent(host_.get(), index, handed.Out());
+        const auto* definition = dynamic_cast<const ComponentDefinition*>(handed.get());
+        result = result >= 0 && definition == nullptr ? NCF_E_UNEXPECTED : result;
+        CheckStep(result, "NCFRegisterComponent failed for component " + std::to_string(index));
+        components_.push_back(definition->facts());
     }
-    return NCF_OK;
 }
 
-NCFRESULT PluginModule::ReadComponent(ncfUInt32 index) {
-    Ref<INCFComponentDefinition> handed;
-    const NCFRESULT result = functions_.registerComponent(host_.get(), index, handed.Out());
-    if (result < 0) {
-        return result;
-    }
-    const auto* definition = dynamic_cast<const ComponentDefinition*>(handed.get());
-    if (definition == nullptr) {
-        return NCF_E_UNEXPECTED;
-    }
-    components_.push_back(definition->facts());
-    return NCF_OK;
-}
-
-NCFRESULT PluginModule::Start(std::string& reason) {
+void PluginModule::Start() {
     const NCFRESULT result = functions_.startup(host_.get());
     if (result < 0) {
         // A start that failed half-way is taken back by the same call.
         functions_.shutdown(host_.get());
-        reason = "NCFStartup failed with " + InHex(result);
-        return result;
     }
+    CheckStep(result, "NCFStartup failed");
     started_ = true;
-    return NCF_OK;
 }
 
 void PluginModule::EnterComponents() {

@@ -58,11 +58,11 @@ private:
 
     PluginModule(const std::filesystem::path& file, INCFUnknown& host, ComponentFactory& factory);
 
-    NCFRESULT Open(std::string& reason);
-    NCFRESULT ReadPlugin(std::string& reason);
-    NCFRESULT ReadComponents(std::string& reason);
-    NCFRESULT ReadComponent(ncfUInt32 index);
-    NCFRESULT Start(std::string& reason);
+    // The steps of loading; each throws a LoadFailure.
+    void Open();
+    void ReadPlugin();
+    void ReadComponents();
+    void Start();
     void EnterComponents();
     void RemoveComponents();
     void Shutdown();

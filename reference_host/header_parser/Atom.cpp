@@ -16,6 +16,16 @@ std::string PlainNameOf(ncfUInt32 type) {
     return name;
 }
 
+bool IsText(ncfUInt32 type, ncfUInt32 further) {
+    for (int shift = 24; shift >= 0; shift -= 8) {
+        const ncfUInt32 c = type >> shift & 0xFF;
+        if (!(c >= 0x20 && c < 0x7F) && c != further) {
+            return false;
+        }
+    }
+    return true;
+}
+
 std::string NameOf(ncfUInt32 type) {
     return "'" + PlainNameOf(type) + "'";
 }

@@ -12,6 +12,8 @@ namespace header_parser {
 // numbers.
 std::string NameOf(ncfUInt32 type);
 std::string PlainNameOf(ncfUInt32 type);  // without the quotes
+// Whether each of the four is a plain character, or the further one.
+bool IsText(ncfUInt32 type, ncfUInt32 further = ' ');
 
 // What an atom begins with: size and type, and behind a size of 1 the true one in
 // 64 bits.

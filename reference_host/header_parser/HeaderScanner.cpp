@@ -24,19 +24,12 @@ constexpr ncfUInt32 kOpeningAtoms[] = {
     Code("meta"), Code("junk"), Code("prfl"), Code("pdin"),
 };
 
+// It begins the types of old user data.
+constexpr ncfUInt32 kCopyrightSign = 0xA9;
+
 bool MayOpenAFile(ncfUInt32 type) {
     return std::find(std::begin(kOpeningAtoms), std::end(kOpeningAtoms), type) !=
            std::end(kOpeningAtoms);
-}
-
-bool IsText(ncfUInt32 type) {
-    for (int shift = 24; shift >= 0; shift -= 8) {
-        const ncfUInt32 c = type >> shift & 0xFF;
-        if (!(c >= 0x20 && c < 0x7F) && c != 0xA9) {
-            return false;
-        }
-    }
-    return true;
 }
 
 bool BelongsToFragments(ncfUInt32 type) {
@@ -125,7 +118,8 @@ Verdict HeaderScanner::Walk(Range& range) {
     if (head.IsOpen() && type == 0) {
         return At(cursor_, NoData("zeros where an atom should begin, before any movie header"));
     }
-    if (atomsSeen_ == 0 ? !MayOpenAFile(type) && !BelongsToFragments(type) : !IsText(type)) {
+    if (atomsSeen_ == 0 ? !MayOpenAFile(type) && !BelongsToFragments(type)
+                        : !IsText(type, kCopyrightSign)) {
         return NoAtomHere(type);
     }
     if (BelongsToFragments(type)) {

@@ -84,9 +84,8 @@ NCFRESULT QTParser::ReadHeader(const ncfUInt8* begin, const ncfUInt8* end, ncfUI
     auto movie = std::make_shared<Movie>();
     verdict = header_parser::ReadMovie(std::move(scanner_.Payload()), limits_, *movie);
     if (verdict.Refused()) {
-        const std::optional<ncfUInt64> position = scanner_.PayloadPosition();
-        Refusal refusal =
-            Locate(verdict, movie->bytes, movie->isUnpacked ? std::nullopt : position);
+        const std::optional<ncfUInt64> inFile = scanner_.PayloadPosition();
+        Refusal refusal = Locate(verdict, movie->bytes, movie->isUnpacked ? std::nullopt : inFile);
         refusal.offset = refusal.offset.value_or(scanner_.AtomPosition());
         return Refuse(std::move(refusal));
     }

@@ -1,6 +1,5 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include <charconv>
 #include <cmath>
 #include <cstring>
 
@@ -9,6 +8,7 @@
 #include "reference_host/parameters/GuidText.h"
 #include "reference_host/parameters/ParameterDocument.h"
 #include "reference_host/parameters/ShownText.h"
+#include "reference_host/util/text/Number.h"
 #include "reference_host/xml/EventReader.h"
 #include "reference_host/xml/XmlTree.h"
 
@@ -83,10 +83,8 @@ GUID IdAttribute(const pugi::xml_node& node) {
 }
 
 ncfUInt32 Number(const pugi::xml_node& node, std::string_view text) {
-    const std::string_view digits = Trimmed(text);
     ncfUInt32 number = 0;
-    const auto end = std::from_chars(digits.data(), digits.data() + digits.size(), number);
-    if (digits.empty() || end.ec != std::errc() || end.ptr != digits.data() + digits.size()) {
+    if (!text::ReadNumber(Trimmed(text), number)) {
         Refuse(node, "holds " + Quoted(text) + ", which is no number of 32 bits without sign");
     }
     return number;
@@ -98,14 +96,20 @@ float Version(const pugi::xml_node& node) {
         return 1.0f;
     }
     const std::string text = TextOf(child);
-    const std::string_view digits = Trimmed(text);
     float number = 0.0f;
-    const auto end = std::from_chars(digits.data(), digits.data() + digits.size(), number);
-    if (digits.empty() || end.ec != std::errc() || end.ptr != digits.data() + digits.size() ||
-        !std::isfinite(number)) {
+    if (!text::ReadNumber(Trimmed(text), number) || !std::isfinite(number)) {
         Refuse(child, "holds " + Quoted(text) + ", which is no version");
     }
     return number;
+}
+
+// Adds what `read` makes of each child of that name.
+template <class Item>
+void ReadEach(const pugi::xml_node& parent, const char* name, Item (*read)(const pugi::xml_node&),
+              std::vector<Item>& items) {
+    for (const pugi::xml_node& child : parent.children(name)) {
+        items.push_back(read(child));
+    }
 }
 
 bool Flag(const pugi::xml_node& node, const char* name) {
@@ -145,9 +149,7 @@ void ReadGroups(const pugi::xml_node& parent, std::vector<ParameterGroup>& out) 
         group.id = IdAttribute(node);
         group.name = ChildText(node, kParamShortName);
         group.isShown = std::strcmp(node.attribute(kParamDisplayState).value(), kParamHide) != 0;
-        for (const pugi::xml_node& parameter : node.children(kParamItem)) {
-            group.parameters.push_back(ReadInfo(parameter));
-        }
+        ReadEach(node, kParamItem, ReadInfo, group.parameters);
         out.push_back(std::move(group));
         ReadGroups(node, out);
     }
@@ -175,9 +177,7 @@ ParameterSet ReadSet(const pugi::xml_node& node) {
     set.version = Version(node);
     set.isDefault = Flag(node, kParamDefault);
     set.isReadOnly = Flag(node, kParamReadOnly);
-    for (const pugi::xml_node& parameter : node.children(kParamItem)) {
-        set.settings.push_back(ReadSetting(parameter));
-    }
+    ReadEach(node, kParamItem, ReadSetting, set.settings);
     return set;
 }
 
@@ -186,18 +186,21 @@ ParameterTrack ReadTrack(const pugi::xml_node& node) {
     track.number = Number(node, node.attribute(kParamNumber).value());
     if (const pugi::xml_node infos = node.child(kParamInfos)) {
         track.descriptionVersion = Version(infos);
-        for (const pugi::xml_node& parameter : infos.children(kParamItem)) {
-            track.parameters.push_back(ReadInfo(parameter));
-        }
+        ReadEach(infos, kParamItem, ReadInfo, track.parameters);
         ReadGroups(infos, track.groups);
     }
     if (const pugi::xml_node active = node.child(kParamActiveSet)) {
         track.activeSet = Id(active, TextOf(active), "the set");
     }
-    for (const pugi::xml_node& set : node.children(kParamSetItem)) {
-        track.sets.push_back(ReadSet(set));
-    }
+    ReadEach(node, kParamSetItem, ReadSet, track.sets);
     return track;
+}
+
+ParameterComponent ReadComponent(const pugi::xml_node& node) {
+    ParameterComponent component;
+    component.id = IdAttribute(node);
+    ReadEach(node, kParamTrack, ReadTrack, component.tracks);
+    return component;
 }
 
 ParameterDocument ReadRoot(const pugi::xml_node& root) {
@@ -205,14 +208,7 @@ ParameterDocument ReadRoot(const pugi::xml_node& root) {
         Refuse(root, std::string("the outermost element of a parameter document is ") + kParamRoot);
     }
     ParameterDocument document;
-    for (const pugi::xml_node& node : root.children(kParamComponent)) {
-        ParameterComponent component;
-        component.id = IdAttribute(node);
-        for (const pugi::xml_node& track : node.children(kParamTrack)) {
-            component.tracks.push_back(ReadTrack(track));
-        }
-        document.components.push_back(std::move(component));
-    }
+    ReadEach(root, kParamComponent, ReadComponent, document.components);
     return document;
 }
 

@@ -14,31 +14,25 @@ NCFRESULT ParameterValue::Clear() {
 }
 
 NCFRESULT ParameterValue::SetData(const GUID& type, const void* data, ncfUInt32 bytes, ncfUInt32) {
-    if (data == nullptr) {
-        return NCF_E_POINTER;
-    }
-    if (type != kValueTypeUInt32) {
-        return NCF_E_NOTSUPPORTED;
-    }
-    ncfUInt32 number = 0;
-    if (bytes != sizeof number) {
-        return NCF_E_INVALIDARG;
-    }
-    std::memcpy(&number, data, sizeof number);
-    number_ = number;
-    return NCF_OK;
+    return Guarded([&] {
+        ncfUInt32 number = 0;
+        Need(data);
+        Need(type == kValueTypeUInt32, NCF_E_NOTSUPPORTED);
+        Need(bytes == sizeof number, NCF_E_INVALIDARG);
+        std::memcpy(&number, data, sizeof number);
+        number_ = number;
+        return NCF_OK;
+    });
 }
 
 NCFRESULT ParameterValue::GetData(void* data, ncfUInt32 bytes) {
-    if (data == nullptr) {
-        return NCF_E_POINTER;
-    }
-    const ncfUInt32 number = number_.value_or(0);
-    if (bytes > (number_ ? sizeof number : 0)) {
-        return NCF_E_FAIL;
-    }
-    std::memcpy(data, &number, bytes);
-    return NCF_OK;
+    return Guarded([&] {
+        const ncfUInt32 number = number_.value_or(0);
+        Need(data);
+        Need(bytes <= (number_ ? sizeof number : 0), NCF_E_FAIL);
+        std::memcpy(data, &number, bytes);
+        return NCF_OK;
+    });
 }
 
 NCFRESULT ValueFactory::CreateValue(IParameterValue** out) {

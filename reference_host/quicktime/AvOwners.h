@@ -33,6 +33,12 @@ struct FreeBy {
     }
 };
 using CodecOwner = std::unique_ptr<AVCodecContext, FreeBy<avcodec_free_context>>;
+// A context for a stream of that form; null without decoder or memory.
+inline CodecOwner MakeCodec(const AVCodec* decoder, const AVCodecParameters& form) {
+    CodecOwner codec(decoder ? avcodec_alloc_context3(decoder) : nullptr);
+    return codec && avcodec_parameters_to_context(codec.get(), &form) >= 0 ? std::move(codec)
+                                                                           : nullptr;
+}
 using FrameOwner = std::unique_ptr<AVFrame, FreeBy<av_frame_free>>;
 using PacketOwner = std::unique_ptr<AVPacket, FreeBy<av_packet_free>>;
 using ParserOwner = std::unique_ptr<AVCodecParserContext, FreeBy<av_parser_close>>;

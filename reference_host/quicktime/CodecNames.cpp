@@ -6,144 +6,125 @@
 extern "C" {
 #include <libavcodec/codec_desc.h>
 #include <libavformat/avformat.h>
+#include <libavutil/bswap.h>
 }
+
+#include "reference_host/header_parser/Atom.h"
 
 namespace host {
 namespace {
 
+using header_parser::Code;
+using header_parser::IsText;
+
 struct Row {
-    char code[5];
+    ncfUInt32 code;
     const char* name;
 };
 
 // Names that people know codecs by; the multimedia library's own are often
 // those of a family, where the code tells one of its members.
 constexpr Row kNames[] = {
-    {"apco", "Apple ProRes 422 Proxy"},
-    {"apcs", "Apple ProRes 422 LT"},
-    {"apcn", "Apple ProRes 422"},
-    {"apch", "Apple ProRes 422 HQ"},
-    {"ap4h", "Apple ProRes 4444"},
-    {"ap4x", "Apple ProRes 4444 XQ"},
-    {"avc1", "H.264"},
-    {"avc2", "H.264"},
-    {"avc3", "H.264"},
-    {"avc4", "H.264"},
-    {"hvc1", "HEVC"},
-    {"hev1", "HEVC"},
-    {"dvh1", "HEVC with Dolby Vision"},
-    {"dvhe", "HEVC with Dolby Vision"},
-    {"av01", "AV1"},
-    {"vp08", "VP8"},
-    {"vp09", "VP9"},
-    {"mp4v", "MPEG-4 Video"},
-    {"mp1v", "MPEG-1 Video"},
-    {"mp2v", "MPEG-2 Video"},
-    {"m2v1", "MPEG-2 Video"},
-    {"mpeg", "MPEG-1 Video"},
-    {"jpeg", "Photo - JPEG"},
-    {"mjpa", "Motion JPEG A"},
-    {"mjpb", "Motion JPEG B"},
-    {"mjp2", "Motion JPEG 2000"},
-    {"png ", "PNG"},
-    {"tiff", "TIFF"},
-    {"gif ", "GIF"},
-    {"rle ", "Animation"},
-    {"cvid", "Cinepak"},
-    {"rpza", "Video"},
-    {"smc ", "Graphics"},
-    {"8BPS", "Planar RGB"},
-    {"SVQ1", "Sorenson Video"},
-    {"SVQ3", "Sorenson Video 3"},
-    {"h261", "H.261"},
-    {"h263", "H.263"},
-    {"s263", "H.263"},
-    {"dvc ", "DV25 NTSC"},
-    {"dvcp", "DV25 PAL"},
-    {"dvpp", "DVCPRO PAL"},
-    {"dvpn", "DVCPRO NTSC"},
-    {"dv5p", "DVCPRO50 PAL"},
-    {"dv5n", "DVCPRO50 NTSC"},
-    {"dvhp", "DVCPRO HD 720p60"},
-    {"dvhq", "DVCPRO HD 720p50"},
-    {"dvh5", "DVCPRO HD 1080i50"},
-    {"dvh6", "DVCPRO HD 1080i60"},
-    {"dvh3", "DVCPRO HD 1080p30"},
-    {"dvh2", "DVCPRO HD 1080p25"},
-    {"hdv1", "HDV 720p30"},
-    {"hdv2", "HDV 1080i60"},
-    {"hdv3", "HDV 1080i50"},
-    {"hdv4", "HDV 720p24"},
-    {"hdv5", "HDV 720p25"},
-    {"hdv6", "HDV 1080p24"},
-    {"hdv7", "HDV 1080p25"},
-    {"hdv8", "HDV 1080p30"},
-    {"hdv9", "HDV 720p60"},
-    {"hdva", "HDV 720p50"},
-    {"mx3n", "IMX 30 NTSC"},
-    {"mx3p", "IMX 30 PAL"},
-    {"mx4n", "IMX 40 NTSC"},
-    {"mx4p", "IMX 40 PAL"},
-    {"mx5n", "IMX 50 NTSC"},
-    {"mx5p", "IMX 50 PAL"},
-    {"v210", "Uncompressed 10-bit 4:2:2"},
-    {"2vuy", "Uncompressed 8-bit 4:2:2"},
-    {"yuv2", "Component Video"},
-    {"yuvs", "Component Video"},
-    {"v308", "Uncompressed 8-bit 4:4:4"},
-    {"v408", "Uncompressed 8-bit 4:4:4:4"},
-    {"v410", "Uncompressed 10-bit 4:4:4"},
-    {"r210", "Uncompressed 10-bit RGB"},
-    {"b48r", "Uncompressed 16-bit RGB"},
-    {"b64a", "Uncompressed 16-bit RGB with Alpha"},
-    {"r4fl", "Uncompressed 32-bit Float"},
-    {"raw ", "Uncompressed RGB"},
-    {"AVdn", "VC-3"},
-    {"AVdh", "VC-3 HR"},
-    {"CFHD", "CineForm"},
-    {"Hap1", "Hap"},
-    {"Hap5", "Hap Alpha"},
-    {"HapY", "Hap Q"},
-    {"icod", "Apple Intermediate Codec"},
-    {"mp4a", "AAC"},
-    {"alac", "Apple Lossless"},
-    {"ac-3", "AC-3"},
-    {"sowt", "Linear PCM"},
-    {"twos", "Linear PCM"},
-    {"lpcm", "Linear PCM"},
+    {Code("apco"), "Apple ProRes 422 Proxy"},
+    {Code("apcs"), "Apple ProRes 422 LT"},
+    {Code("apcn"), "Apple ProRes 422"},
+    {Code("apch"), "Apple ProRes 422 HQ"},
+    {Code("ap4h"), "Apple ProRes 4444"},
+    {Code("ap4x"), "Apple ProRes 4444 XQ"},
+    {Code("avc1"), "H.264"},
+    {Code("avc2"), "H.264"},
+    {Code("avc3"), "H.264"},
+    {Code("avc4"), "H.264"},
+    {Code("hvc1"), "HEVC"},
+    {Code("hev1"), "HEVC"},
+    {Code("dvh1"), "HEVC with Dolby Vision"},
+    {Code("dvhe"), "HEVC with Dolby Vision"},
+    {Code("av01"), "AV1"},
+    {Code("vp08"), "VP8"},
+    {Code("vp09"), "VP9"},
+    {Code("mp4v"), "MPEG-4 Video"},
+    {Code("mp1v"), "MPEG-1 Video"},
+    {Code("mp2v"), "MPEG-2 Video"},
+    {Code("m2v1"), "MPEG-2 Video"},
+    {Code("mpeg"), "MPEG-1 Video"},
+    {Code("jpeg"), "Photo - JPEG"},
+    {Code("mjpa"), "Motion JPEG A"},
+    {Code("mjpb"), "Motion JPEG B"},
+    {Code("mjp2"), "Motion JPEG 2000"},
+    {Code("png "), "PNG"},
+    {Code("tiff"), "TIFF"},
+    {Code("gif "), "GIF"},
+    {Code("rle "), "Animation"},
+    {Code("cvid"), "Cinepak"},
+    {Code("rpza"), "Video"},
+    {Code("smc "), "Graphics"},
+    {Code("8BPS"), "Planar RGB"},
+    {Code("SVQ1"), "Sorenson Video"},
+    {Code("SVQ3"), "Sorenson Video 3"},
+    {Code("h261"), "H.261"},
+    {Code("h263"), "H.263"},
+    {Code("s263"), "H.263"},
+    {Code("dvc "), "DV25 NTSC"},
+    {Code("dvcp"), "DV25 PAL"},
+    {Code("dvpp"), "DVCPRO PAL"},
+    {Code("dvpn"), "DVCPRO NTSC"},
+    {Code("dv5p"), "DVCPRO50 PAL"},
+    {Code("dv5n"), "DVCPRO50 NTSC"},
+    {Code("dvhp"), "DVCPRO HD 720p60"},
+    {Code("dvhq"), "DVCPRO HD 720p50"},
+    {Code("dvh5"), "DVCPRO HD 1080i50"},
+    {Code("dvh6"), "DVCPRO HD 1080i60"},
+    {Code("dvh3"), "DVCPRO HD 1080p30"},
+    {Code("dvh2"), "DVCPRO HD 1080p25"},
+    {Code("hdv1"), "HDV 720p30"},
+    {Code("hdv2"), "HDV 1080i60"},
+    {Code("hdv3"), "HDV 1080i50"},
+    {Code("hdv4"), "HDV 720p24"},
+    {Code("hdv5"), "HDV 720p25"},
+    {Code("hdv6"), "HDV 1080p24"},
+    {Code("hdv7"), "HDV 1080p25"},
+    {Code("hdv8"), "HDV 1080p30"},
+    {Code("hdv9"), "HDV 720p60"},
+    {Code("hdva"), "HDV 720p50"},
+    {Code("mx3n"), "IMX 30 NTSC"},
+    {Code("mx3p"), "IMX 30 PAL"},
+    {Code("mx4n"), "IMX 40 NTSC"},
+    {Code("mx4p"), "IMX 40 PAL"},
+    {Code("mx5n"), "IMX 50 NTSC"},
+    {Code("mx5p"), "IMX 50 PAL"},
+    {Code("v210"), "Uncompressed 10-bit 4:2:2"},
+    {Code("2vuy"), "Uncompressed 8-bit 4:2:2"},
+    {Code("yuv2"), "Component Video"},
+    {Code("yuvs"), "Component Video"},
+    {Code("v308"), "Uncompressed 8-bit 4:4:4"},
+    {Code("v408"), "Uncompressed 8-bit 4:4:4:4"},
+    {Code("v410"), "Uncompressed 10-bit 4:4:4"},
+    {Code("r210"), "Uncompressed 10-bit RGB"},
+    {Code("b48r"), "Uncompressed 16-bit RGB"},
+    {Code("b64a"), "Uncompressed 16-bit RGB with Alpha"},
+    {Code("r4fl"), "Uncompressed 32-bit Float"},
+    {Code("raw "), "Uncompressed RGB"},
+    {Code("AVdn"), "VC-3"},
+    {Code("AVdh"), "VC-3 HR"},
+    {Code("CFHD"), "CineForm"},
+    {Code("Hap1"), "Hap"},
+    {Code("Hap5"), "Hap Alpha"},
+    {Code("HapY"), "Hap Q"},
+    {Code("icod"), "Apple Intermediate Codec"},
+    {Code("mp4a"), "AAC"},
+    {Code("alac"), "Apple Lossless"},
+    {Code("ac-3"), "AC-3"},
+    {Code("sowt"), "Linear PCM"},
+    {Code("twos"), "Linear PCM"},
+    {Code("lpcm"), "Linear PCM"},
 };
 
 // Families whose codes count upward with raster and rate.
-struct FamilyRow {
-    const char* start;
-    const char* name;
+constexpr Row kFamilies[] = {
+    {Code("xdv."), "XDCAM EX"},      {Code("xd5."), "XDCAM HD422"},
+    {Code("xdh."), "XDCAM HD 540p"}, {Code("ai1."), "AVC-Intra 100"},
+    {Code("ai5."), "AVC-Intra 50"},
 };
-constexpr FamilyRow kFamilies[] = {
-    {"xdv", "XDCAM EX"},      {"xd5", "XDCAM HD422"},  {"xdh", "XDCAM HD 540p"},
-    {"ai1", "AVC-Intra 100"}, {"ai5", "AVC-Intra 50"},
-};
-
-std::string TextOf(ncfUInt32 code) {
-    std::string text;
-    for (const int shift : {24, 16, 8, 0}) {
-        text += static_cast<char>(code >> shift & 0xFF);
-    }
-    return text;
-}
-
-ncfUInt32 Swapped(ncfUInt32 tag) {
-    return tag << 24 | (tag & 0xFF00u) << 8 | (tag >> 8 & 0xFF00u) | tag >> 24;
-}
-
-bool IsText(ncfUInt32 code) {
-    for (const int shift : {24, 16, 8, 0}) {
-        const ncfUInt32 c = code >> shift & 0xFF;
-        if (c < 0x20 || c > 0x7E) {
-            return false;
-        }
-    }
-    return true;
-}
 
 std::string LibraryName(AVCodecID codec) {
     const AVCodecDescriptor* const descriptor = avcodec_descriptor_get(codec);
@@ -157,7 +138,7 @@ std::string LibraryName(ncfUInt32 code) {
          {avformat_get_mov_video_tags(), avformat_get_mov_audio_tags(),
           avformat_get_riff_video_tags()}) {
         const AVCodecTag* const tables[] = {table, nullptr};
-        const std::string name = LibraryName(av_codec_get_id(tables, Swapped(code)));
+        const std::string name = LibraryName(av_codec_get_id(tables, CodeOfTag(code)));
         if (!name.empty()) {
             return name;
         }
@@ -167,14 +148,13 @@ std::string LibraryName(ncfUInt32 code) {
 
 // By the rows above alone; empty for other codes.
 std::string OwnName(ncfUInt32 code) {
-    const std::string text = TextOf(code);
     for (const Row& row : kNames) {
-        if (text == row.code) {
+        if (row.code == code) {
             return row.name;
         }
     }
-    for (const FamilyRow& row : kFamilies) {
-        if (text.compare(0, 3, row.start) == 0) {
+    for (const Row& row : kFamilies) {
+        if (row.code >> 8 == code >> 8) {
             return row.name;
         }
     }
@@ -184,11 +164,12 @@ std::string OwnName(ncfUInt32 code) {
 // Codes of still pictures that movies hold by another codec's name.
 struct StillRow {
     AVCodecID codec;
-    const char* code;
+    ncfUInt32 code;
 };
 constexpr StillRow kStills[] = {
-    {AV_CODEC_ID_BMP, "WRLE"},   {AV_CODEC_ID_PSD, "8BPS"}, {AV_CODEC_ID_SGI, ".SGI"},
-    {AV_CODEC_ID_TARGA, "tga "}, {AV_CODEC_ID_PCX, "PCX "},
+    {AV_CODEC_ID_BMP, Code("WRLE")}, {AV_CODEC_ID_PSD, Code("8BPS")},
+    {AV_CODEC_ID_SGI, Code(".SGI")}, {AV_CODEC_ID_TARGA, Code("tga ")},
+    {AV_CODEC_ID_PCX, Code("PCX ")},
 };
 
 // The first four characters, spaces behind a shorter text.
@@ -211,11 +192,15 @@ ncfUInt32 CodeInMovies(const AVCodecParameters& form) {
                                             ? avformat_get_mov_audio_tags()
                                             : avformat_get_mov_video_tags(),
                                         nullptr};
-    const ncfUInt32 code = Swapped(av_codec_get_tag(tables, form.codec_id));
+    const ncfUInt32 code = CodeOfTag(av_codec_get_tag(tables, form.codec_id));
     return IsText(code) ? code : 0;
 }
 
 }  // namespace
+
+ncfUInt32 CodeOfTag(unsigned tag) {
+    return av_bswap32(tag);
+}
 
 NCFRESULT CodecName(ncfUInt32 code, std::string& name) {
     if (!IsText(code)) {
@@ -229,33 +214,33 @@ NCFRESULT CodecName(ncfUInt32 code, std::string& name) {
 }
 
 ncfUInt32 CodecCode(const AVCodecParameters& form) {
-    if (IsText(Swapped(form.codec_tag))) {
-        return Swapped(form.codec_tag);
+    if (IsText(CodeOfTag(form.codec_tag))) {
+        return CodeOfTag(form.codec_tag);
     }
     if (const ncfUInt32 code = CodeInMovies(form)) {
         return code;
     }
     for (const StillRow& row : kStills) {
         if (row.codec == form.codec_id) {
-            return CodeOf(row.code);
+            return row.code;
         }
     }
     const AVCodecTag* const tables[] = {avformat_get_riff_video_tags(), nullptr};
-    const ncfUInt32 code = Swapped(av_codec_get_tag(tables, form.codec_id));
+    const ncfUInt32 code = CodeOfTag(av_codec_get_tag(tables, form.codec_id));
     const AVCodecDescriptor* const codec = avcodec_descriptor_get(form.codec_id);
     return IsText(code) ? code : codec ? CodeOf(codec->name) : 0;
 }
 
 std::string CodecNameOf(const AVCodecParameters& form) {
-    std::string name = OwnName(Swapped(form.codec_tag));
+    std::string name = OwnName(CodeOfTag(form.codec_tag));
     if (name.empty() && !HasManyCodes(form.codec_id)) {
         name = OwnName(CodeInMovies(form));
     }
     if (name.empty()) {
         name = LibraryName(form.codec_id);
     }
-    if (name.empty() && IsText(Swapped(form.codec_tag))) {
-        name = LibraryName(Swapped(form.codec_tag));
+    if (name.empty() && IsText(CodeOfTag(form.codec_tag))) {
+        name = LibraryName(CodeOfTag(form.codec_tag));
     }
     return name;
 }

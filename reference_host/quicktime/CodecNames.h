@@ -23,4 +23,7 @@ ncfUInt32 CodecCode(const AVCodecParameters& form);
 // A person's name for a stream's codec; empty only for codecs that nobody knows.
 std::string CodecNameOf(const AVCodecParameters& form);
 
+// The code whose characters a tag of the library holds, the first in its lowest byte.
+ncfUInt32 CodeOfTag(unsigned tag);
+
 }  // namespace host

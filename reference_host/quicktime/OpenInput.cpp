@@ -90,12 +90,6 @@ AVIOContext* OpenBytes(const std::filesystem::path& path) {
     return bytes;
 }
 
-std::string ErrorText(int error) {
-    char text[AV_ERROR_MAX_STRING_SIZE] = {};
-    av_strerror(error, text, sizeof text);
-    return text;
-}
-
 // Whether every sound and picture stream tells its form already; most files do
 // in their headers, and reading on would cost what decoding costs.
 bool AreStreamsKnown(const AVFormatContext& input) {
@@ -182,6 +176,12 @@ InputOwner OpenForStream(const std::filesystem::path& path, InputView view, int 
     InputOwner input = OpenInput(path, view, ignored);
     return input && stream >= 0 && stream < static_cast<int>(input->nb_streams) ? std::move(input)
                                                                                 : nullptr;
+}
+
+std::string ErrorText(int error) {
+    char text[AV_ERROR_MAX_STRING_SIZE] = {};
+    av_strerror(error, text, sizeof text);
+    return text;
 }
 
 std::string TooManyChannels() {

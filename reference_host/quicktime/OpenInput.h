@@ -43,4 +43,7 @@ bool HasStreamDetails(const AVFormatContext& input);
 // Lets the demuxer hand out one stream alone.
 void UseOneStream(AVFormatContext& input, int stream);
 
+// The library's words for one of its error numbers.
+std::string ErrorText(int error);
+
 }  // namespace host

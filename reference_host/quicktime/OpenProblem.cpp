@@ -8,6 +8,7 @@
 #include <iterator>
 
 #include "reference_host/header_parser/Atom.h"
+#include "reference_host/quicktime/CodecNames.h"
 #include "reference_host/quicktime/MovieFile.h"
 #include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/RasterClaim.h"
@@ -16,7 +17,6 @@ extern "C" {
 #include <libavcodec/avcodec.h>
 #include <libavformat/avformat.h>
 #include <libavutil/avutil.h>
-#include <libavutil/bswap.h>
 #include <libavutil/error.h>
 }
 
@@ -26,10 +26,6 @@ namespace {
 using header_parser::Code;
 
 constexpr ncfUInt32 kEncrypted[] = {Code("encv"), Code("enca"), Code("drmi"), Code("drms")};
-
-ncfUInt32 CodeOf(const AVCodecParameters& form) {
-    return av_bswap32(form.codec_tag);
-}
 
 // Whether a codec of that code is one of the other kind of track.
 bool IsOfOtherKind(const AVCodecParameters& form) {
@@ -42,21 +38,31 @@ bool IsOfOtherKind(const AVCodecParameters& form) {
 
 // What a decoder says when it rejects the description of its samples.
 std::string OpeningProblem(const AVCodec& decoder, const AVCodecParameters& form) {
-    AVCodecContext* context = avcodec_alloc_context3(&decoder);
-    int result = context ? avcodec_parameters_to_context(context, &form) : AVERROR(ENOMEM);
+    const CodecOwner context(avcodec_alloc_context3(&decoder));
+    int result = context ? avcodec_parameters_to_context(context.get(), &form) : AVERROR(ENOMEM);
     if (result >= 0) {
-        result = avcodec_open2(context, &decoder, nullptr);
+        result = avcodec_open2(context.get(), &decoder, nullptr);
     }
-    avcodec_free_context(&context);
-    char text[AV_ERROR_MAX_STRING_SIZE] = {};
-    av_strerror(result, text, sizeof text);
-    return result < 0 ? text : std::string();
+    return result < 0 ? ErrorText(result) : std::string();
+}
+
+// One of the streams of a kind, counted from 0; null for none. A picture attached
+// to sound is none.
+const AVStream* FindOfKind(const AVFormatContext& input, AVMediaType kind, std::size_t place) {
+    for (unsigned i = 0; i < input.nb_streams; ++i) {
+        const AVStream& stream = *input.streams[i];
+        if (stream.codecpar->codec_type == kind &&
+            (stream.disposition & AV_DISPOSITION_ATTACHED_PIC) == 0 && place-- == 0) {
+            return &stream;
+        }
+    }
+    return nullptr;
 }
 
 CodecProblem ProblemOf(const AVStream& stream) {
     const AVCodecParameters& form = *stream.codecpar;
     const bool isSound = form.codec_type == AVMEDIA_TYPE_AUDIO;
-    const ncfUInt32 code = CodeOf(form);
+    const ncfUInt32 code = CodeOfTag(form.codec_tag);
     const std::string track = "track " + std::to_string(stream.index + 1) + " of the file: ";
     const std::string name = header_parser::NameOf(code);
     if (IsEncrypted(code)) {
@@ -88,9 +94,9 @@ std::string OpenProblem(const std::filesystem::path& path) {
 }
 
 CodecProblem DecoderProblem(const std::filesystem::path& path, std::size_t track) {
-    std::string reason;
-    const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
-    return input && track < input->nb_streams ? ProblemOf(*input->streams[track]) : CodecProblem();
+    const auto stream = static_cast<int>(track);
+    const InputOwner input = OpenForStream(path, InputView::AsPresented, stream);
+    return input ? ProblemOf(*input->streams[stream]) : CodecProblem();
 }
 
 bool IsEncrypted(std::uint32_t code) {
@@ -100,33 +106,19 @@ bool IsEncrypted(std::uint32_t code) {
 CodecProblem DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place) {
     std::string reason;
     const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
-    const AVMediaType wanted = ofSound ? AVMEDIA_TYPE_AUDIO : AVMEDIA_TYPE_VIDEO;
-    for (unsigned i = 0; input && i < input->nb_streams; ++i) {
-        const AVStream& stream = *input->streams[i];
-        if (stream.codecpar->codec_type != wanted ||
-            (stream.disposition & AV_DISPOSITION_ATTACHED_PIC) != 0) {
-            continue;
-        }
-        if (place-- == 0) {
-            return ProblemOf(stream);
-        }
-    }
-    return {};
+    const AVStream* const stream =
+        input ? FindOfKind(*input, ofSound ? AVMEDIA_TYPE_AUDIO : AVMEDIA_TYPE_VIDEO, place)
+              : nullptr;
+    return stream ? ProblemOf(*stream) : CodecProblem();
 }
 
 std::string RasterProblem(const std::filesystem::path& path) {
     std::string reason;
     const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
-    for (unsigned i = 0; input && i < input->nb_streams; ++i) {
-        const AVStream& stream = *input->streams[i];
-        if (stream.codecpar->codec_type == AVMEDIA_TYPE_VIDEO &&
-            (stream.disposition & AV_DISPOSITION_ATTACHED_PIC) == 0) {
-            const std::string claim = FindImpossibleRaster(path, static_cast<int>(i));
-            return claim.empty() ? claim
-                                 : "track " + std::to_string(i + 1) + " of the file: " + claim;
-        }
-    }
-    return {};
+    const AVStream* const stream = input ? FindOfKind(*input, AVMEDIA_TYPE_VIDEO, 0) : nullptr;
+    const std::string claim = stream ? FindImpossibleRaster(path, stream->index) : std::string();
+    return claim.empty() ? claim
+                         : "track " + std::to_string(stream->index + 1) + " of the file: " + claim;
 }
 
 bool NeedsRasterCheck(const std::filesystem::path& path) {

@@ -21,8 +21,8 @@ constexpr std::size_t kNearPackets = 4;
 
 CodecOwner OpenDecoder(const AVStream& stream) {
     const AVCodec* const decoder = avcodec_find_decoder(stream.codecpar->codec_id);
-    CodecOwner codec(decoder ? avcodec_alloc_context3(decoder) : nullptr);
-    if (!codec || avcodec_parameters_to_context(codec.get(), stream.codecpar) < 0) {
+    CodecOwner codec = MakeCodec(decoder, *stream.codecpar);
+    if (!codec) {
         return nullptr;
     }
     codec->pkt_timebase = stream.time_base;

@@ -35,10 +35,9 @@ int NoteRaster(AVCodecContext* codec, AVFrame* frame, int) {
 
 CodecOwner OpenWithoutSize(const AVCodecParameters& form, Raster& noted) {
     const AVCodec* const decoder = avcodec_find_decoder(form.codec_id);
-    CodecOwner codec(decoder && (decoder->capabilities & AV_CODEC_CAP_DR1) != 0
-                         ? avcodec_alloc_context3(decoder)
-                         : nullptr);
-    if (!codec || avcodec_parameters_to_context(codec.get(), &form) < 0) {
+    const bool isDirect = decoder && (decoder->capabilities & AV_CODEC_CAP_DR1) != 0;
+    CodecOwner codec = MakeCodec(isDirect ? decoder : nullptr, form);
+    if (!codec) {
         return nullptr;
     }
     codec->width = codec->coded_width = codec->height = codec->coded_height = kNoSize;

@@ -31,8 +31,8 @@ bool NeedsDivision(AVCodecID codec) {
 
 std::unique_ptr<SoundCodec> SoundCodec::Open(const AVStream& stream, bool keepsPriming) {
     const AVCodec* const decoder = DecoderFor(stream.codecpar->codec_id);
-    CodecOwner codec(decoder ? avcodec_alloc_context3(decoder) : nullptr);
-    if (!codec || avcodec_parameters_to_context(codec.get(), stream.codecpar) < 0) {
+    CodecOwner codec = MakeCodec(decoder, *stream.codecpar);
+    if (!codec) {
         return nullptr;
     }
     codec->pkt_timebase = stream.time_base;

@@ -4,12 +4,12 @@
 #include <unistd.h>
 
 #include <cerrno>
-#include <charconv>
 #include <csignal>
 #include <string_view>
 #include <utility>
 
 #include "reference_host/system/OutputStream.h"
+#include "reference_host/util/text/Number.h"
 
 namespace host::system {
 
@@ -28,11 +28,10 @@ std::optional<int> DescriptorOf(const std::filesystem::path& path) {
     }
     for (const std::string_view folder : {"/dev/fd/", "/proc/self/fd/"}) {
         int number = 0;
-        const char* const end = name.data() + name.size();
         if (name.substr(0, folder.size()) == folder) {
-            const auto read = std::from_chars(name.data() + folder.size(), end, number);
-            return read.ec == std::errc() && read.ptr == end && number >= 0 ? std::optional(number)
-                                                                            : std::nullopt;
+            return text::ReadNumber(name.substr(folder.size()), number) && number >= 0
+                       ? std::optional(number)
+                       : std::nullopt;
         }
     }
     return std::nullopt;

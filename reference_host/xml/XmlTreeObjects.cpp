@@ -77,6 +77,19 @@ private:
     const void* key_;
 };
 
+// The object of one of several siblings, into an interface output.
+template <class Item>
+NCFRESULT GiveObject(XmlTree& tree, Siblings<Item>& items, ncfUInt32 index, IXmlNode** out) {
+    return Guarded([&] {
+        Need(out);
+        *out = nullptr;
+        const Item item = items.At(index);
+        Need(item, NCF_E_INVALIDARG);
+        *out = tree.ObjectFor(item).Detach();
+        return NCF_OK;
+    });
+}
+
 // The attributes of an element, in the order of the text.
 class AttributeList final : public Component<IXmlAttributeList> {
 public:
@@ -86,18 +99,7 @@ public:
     ncfUInt32 GetCount() override { return attributes_.Count(); }
 
     NCFRESULT GetItem(ncfUInt32 index, IXmlNode** out) override {
-        if (out == nullptr) {
-            return NCF_E_POINTER;
-        }
-        *out = nullptr;
-        return Guarded([&] {
-            const pugi::xml_attribute attribute = attributes_.At(index);
-            if (!attribute) {
-                return NCF_E_INVALIDARG;
-            }
-            *out = tree_->ObjectFor(attribute).Detach();
-            return NCF_OK;
-        });
+        return GiveObject(*tree_, attributes_, index, out);
     }
 
 private:
@@ -147,30 +149,15 @@ public:
     ncfUInt32 GetChildCount() override { return children_.Count(); }
 
     NCFRESULT GetChild(ncfUInt32 index, IXmlNode** out) override {
-        if (out == nullptr) {
-            return NCF_E_POINTER;
-        }
-        *out = nullptr;
-        return Guarded([&] {
-            const pugi::xml_node child = children_.At(index);
-            if (!child) {
-                return NCF_E_INVALIDARG;
-            }
-            *out = this->tree_->ObjectFor(child).Detach();
-            return NCF_OK;
-        });
+        return GiveObject(*this->tree_, children_, index, out);
     }
 
     // Only elements have a list, which may be empty.
     NCFRESULT GetAttributes(IXmlAttributeList** out) override {
-        if (out == nullptr) {
-            return NCF_E_POINTER;
-        }
-        *out = nullptr;
-        if (node_.type() != pugi::node_element) {
-            return NMA_E_NODATA;
-        }
         return Guarded([&] {
+            Need(out);
+            *out = nullptr;
+            Need(node_.type() == pugi::node_element, NMA_E_NODATA);
             *out = MakeRef<AttributeList>(this->tree_, node_).Detach();
             return NCF_OK;
         });

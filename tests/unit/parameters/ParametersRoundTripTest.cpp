@@ -148,7 +148,7 @@ TEST_F(ParametersRoundTrip, TheViewsReadTheDescription) {
         param.GetDescription(label);
         EXPECT_EQ(label, NMAString(wanted.label));
         ASSERT_EQ(param.GetValueInfo(info), NCF_OK);
-        EXPECT_EQ(info.GetKind(), kParamKindDiscrete);
+        EXPECT_EQ(info.GetKind(), NMA::kParamKindDiscrete);
         ncfUInt32* choices = nullptr;
         ncfUInt32 count = 0;
         ncfUInt32 defaultValue = 0;
