@@ -15,8 +15,6 @@ namespace quicktime_tests {
 
 using Bytes = std::vector<std::uint8_t>;
 
-bool HaveFfmpeg();
-
 // A file of its own that lives as long as this object. It is made by the
 // ffmpeg command with `arguments`, and ends in `ending`.
 class MadeMovie {
@@ -60,10 +58,3 @@ constexpr ncfUInt32 Code(const char (&text)[5]) {
 }
 
 }  // namespace quicktime_tests
-
-// Leaves a test out where there is no ffmpeg command.
-#define NEEDS_FFMPEG()                             \
-    if (!quicktime_tests::HaveFfmpeg()) {          \
-        GTEST_SKIP() << "ffmpeg is not installed"; \
-    }                                              \
-    static_assert(true, "")
