@@ -1,8 +1,8 @@
 # not_implemented_interfaces(NAME)
-# A library of headers alone. Writes into the build folder, for each header that AAF.h includes, a header of
-# the same name in not_implemented/ with one specialisation of aaf::NotImplemented
-# for each of its interfaces, and not_implemented/AAF.h, which includes all of
-# them. They are written again whenever a header changes. An operation has the form
+# A library of headers alone. Writes into the build folder, for each header that AAF.h
+# includes, a header of the same name in not_implemented/ with one specialisation of
+# aaf::NotImplemented for each of its interfaces, and not_implemented/AAF.h, which includes
+# all of them. They are written again whenever a header changes. An operation has the form
 # `virtual HRESULT Name(arguments) = 0;` and a name for every argument.
 function(not_implemented_interfaces name)
   set(folder ${PROJECT_BINARY_DIR}/generated)

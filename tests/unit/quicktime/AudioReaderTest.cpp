@@ -62,7 +62,6 @@ void PrintTo(const Kind& kind, std::ostream* out) {
 class EverySound : public testing::TestWithParam<Kind> {};
 
 TEST_P(EverySound, EqualsWhatFfmpegDecodesBitForBit) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(kTwoTones + std::string(GetParam().arguments), GetParam().ending);
     for (const bool little : {true, false}) {
         const Bytes wanted = movie.Decoded(little ? "-map 0:a:0 -f s24le" : "-map 0:a:0 -f s24be",
@@ -129,7 +128,6 @@ INSTANTIATE_TEST_SUITE_P(
 
 // The edit list hides the encoder's priming: a click stays in its place.
 TEST(AudioReader, PlacesSoundAfterThePrimingThatTheEditListHides) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i aevalsrc='if(between(n\\,24000\\,24010)\\,0.9\\,0)':d=1:s=48000 "
         "-c:a aac -b:a 256k");
@@ -152,7 +150,6 @@ TEST(AudioReader, PlacesSoundAfterThePrimingThatTheEditListHides) {
 }
 
 TEST(AudioReader, GivesSilenceForAnEmptyEdit) {
-    NEEDS_FFMPEG();
     const MadeMovie plain("-f lavfi -i sine=d=1:r=48000 -c:a pcm_s16le");
     const MadeMovie late("-itsoffset 0.5 -i " + plain.Quoted() +
                          " -f lavfi -i color=s=32x32:d=1 -map 0 -map 1 -c:a copy -c:v mpeg4");
@@ -171,7 +168,6 @@ TEST(AudioReader, GivesSilenceForAnEmptyEdit) {
 
 // Fragments cut from a longer movie begin when their first sample does.
 TEST(AudioReader, BeginsWithTheFirstOfLateFragments) {
-    NEEDS_FFMPEG();
     const MadeMovie early(
         "-f lavfi -i sine=d=1:r=48000 -c:a pcm_s16le -frag_duration 200000 -movflags "
         "frag_keyframe+empty_moov+default_base_moof");
@@ -236,7 +232,6 @@ TEST(AudioReader, PutsThePiecesOfAnEditListTogether) {
 }
 
 TEST(AudioReader, KeepsTheParametersOfEachTrackApart) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i sine=d=1:r=48000 -f lavfi -i sine=f=300:d=1:r=44100 -map 0 -map 1 "
         "-c:a pcm_s16le -ac:a:0 1 -ac:a:1 2");
@@ -252,7 +247,6 @@ TEST(AudioReader, KeepsTheParametersOfEachTrackApart) {
 }
 
 TEST(AudioReader, WritesNoMoreThanTheRoomGiven) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i sine=d=1:r=48000 -c:a pcm_s16le");
     const auto reader = OpenSound(movie.Path());
     ASSERT_TRUE(reader);
@@ -266,7 +260,6 @@ TEST(AudioReader, WritesNoMoreThanTheRoomGiven) {
 }
 
 TEST(AudioReader, RefusesWhatItCantServe) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i sine=d=1:r=48000 -c:a pcm_s16le");
     const auto reader = OpenSound(movie.Path());
     ASSERT_TRUE(reader);

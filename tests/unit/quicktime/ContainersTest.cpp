@@ -66,7 +66,6 @@ Bytes PacketsOf(const std::filesystem::path& path, int stream) {
 }
 
 TEST(Containers, TellPlacesOfSamplesOnlyWhereTheirBytesAre) {
-    NEEDS_FFMPEG();
     for (const Row& row : Rows()) {
         SCOPED_TRACE(row.ending);
         const MadeMovie movie(row.arguments, row.ending);
@@ -100,7 +99,6 @@ TEST(Containers, TellPlacesOfSamplesOnlyWhereTheirBytesAre) {
 }
 
 TEST(Containers, TellRateLengthAndNames) {
-    NEEDS_FFMPEG();
     for (const Row& row : Rows()) {
         SCOPED_TRACE(row.ending);
         const MadeMovie movie(row.arguments, row.ending);
@@ -132,7 +130,6 @@ TEST(Containers, TellRateLengthAndNames) {
 
 // What the file tells by its bytes alone: as long as its packets.
 TEST(Containers, MeasureSoundThatTellsNoLength) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i sine=d=3:r=48000 -c:a aac -b:a 20k", ".aac");
     const auto packets = movie.Probed("-show_entries packet=size").size();
     const auto wrapper = OpenWrapper(movie.Path());

@@ -34,7 +34,6 @@ MadeMovie TracksOf(int count, const std::string& form) {
 
 // More than are decoded in one reading of the movie.
 TEST(DecodedSound, IsToldOfEachOfManyTracks) {
-    NEEDS_FFMPEG();
     const MadeMovie movie = TracksOf(100, "-ac 1 -c:a libmp3lame");
     const auto told = host::DecodeFirstSounds(movie.Path(), Streams(100));
     EXPECT_EQ(told.size(), 100u);
@@ -47,7 +46,6 @@ TEST(DecodedSound, IsToldOfEachOfManyTracks) {
 
 // The descriptions tell of one channel each, the packets hold two.
 TEST(DecodedSound, OfAllTracksTogetherHasABound) {
-    NEEDS_FFMPEG();
     for (const int count : {512, 513}) {
         Bytes bytes = TracksOf(count, "-ac 2 -c:a libmp3lame").Content();
         constexpr char kCodec[] = {'s', 't', 's', 'd', 0, 0, 0, 0, 0, 0, 0, 1};
@@ -78,7 +76,6 @@ TEST(DecodedSound, OfAllTracksTogetherHasABound) {
 }
 
 TEST(DecodedSound, IsToldOfStreamsThatAreAskedFor) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc=d=0.5:s=64x64 -f lavfi -i sine=440:d=0.5:r=44100 "
         "-f lavfi -i sine=440:d=0.5:r=22050 -map 0 -map 1 -map 2 -c:v mpeg4 -c:a:0 aac -ac:a:0 2 "

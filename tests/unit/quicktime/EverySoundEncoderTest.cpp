@@ -44,7 +44,6 @@ constexpr int kSeconds = 4;
 class EverySoundEncoder : public testing::TestWithParam<SoundCase> {};
 
 TEST_P(EverySoundEncoder, GivesAnyRangeAloneAsInTheWhole) {
-    NEEDS_FFMPEG();
     const SoundCase& encoder = GetParam();
     const MadeMovie movie("-f lavfi -i \"" + SoundSource(encoder.rate, encoder.layout, kSeconds) +
                               "\" " + encoder.encoder,

@@ -16,7 +16,6 @@ constexpr int kPictures = 12;
 class FieldsApart : public testing::TestWithParam<const char*> {
 protected:
     void SetUp() override {
-        NEEDS_FFMPEG();
         const MadeMovie stream(FieldCodedVideo(kPictures), ".h264");
         // Fifty packets a second.
         movie_ = std::make_unique<MadeMovie>(

@@ -20,7 +20,6 @@ Bytes SmallMovie() {
 }
 
 TEST(HostileMovies, CutAnywhereComeBack) {
-    NEEDS_FFMPEG();
     const Bytes whole = SmallMovie();
     for (std::size_t size = 0; size < whole.size(); size += 97) {
         const MadeMovie cut(Bytes(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(size)),
@@ -30,7 +29,6 @@ TEST(HostileMovies, CutAnywhereComeBack) {
 }
 
 TEST(HostileMovies, WithBitsTurnedComeBack) {
-    NEEDS_FFMPEG();
     const Bytes whole = SmallMovie();
     std::mt19937 random(11);
     for (int i = 0; i < 150; ++i) {

@@ -35,11 +35,6 @@ Bytes OutputOf(const std::string& command) {
 
 }  // namespace
 
-bool HaveFfmpeg() {
-    static const bool have = std::system("ffmpeg -version > /dev/null 2>&1") == 0;
-    return have;
-}
-
 MadeMovie::MadeMovie(const std::string& arguments, const std::string& ending)
     : path_(folder_ / ("made" + ending)) {
     const std::string command = "ffmpeg -y -v error " + arguments + " " + Quoted();

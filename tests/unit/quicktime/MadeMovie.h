@@ -16,8 +16,6 @@ namespace quicktime_tests {
 
 using Bytes = std::vector<std::uint8_t>;
 
-bool HaveFfmpeg();
-
 // A file of its own that lives as long as this object. It is made by the
 // ffmpeg command with `arguments`, and ends in `ending`.
 class MadeMovie {
@@ -56,10 +54,3 @@ double Psnr(const Bytes& a, const Bytes& b);
 using header_parser::Code;
 
 }  // namespace quicktime_tests
-
-// Leaves a test out where there is no ffmpeg command.
-#define NEEDS_FFMPEG()                             \
-    if (!quicktime_tests::HaveFfmpeg()) {          \
-        GTEST_SKIP() << "ffmpeg is not installed"; \
-    }                                              \
-    static_assert(true, "")

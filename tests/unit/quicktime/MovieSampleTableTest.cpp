@@ -71,21 +71,18 @@ void ExpectPacketsOfFfprobe(const MadeMovie& movie) {
 }
 
 TEST(MovieSampleTable, ListsThePacketsOfReorderedVideo) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=2 -c:v libx264 -bf 2 -g 12");
     ExpectPacketsOfFfprobe(movie);
     EXPECT_NE(OpenTable(movie.Path())->HasOutOfOrderFrameDependencies(1), 0);
 }
 
 TEST(MovieSampleTable, ListsThePacketsOfVideoInOrder) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=1 -c:v prores_ks");
     ExpectPacketsOfFfprobe(movie);
     EXPECT_EQ(OpenTable(movie.Path())->HasOutOfOrderFrameDependencies(1), 0);
 }
 
 TEST(MovieSampleTable, HoldsAlsoWhatTheEditListHides) {
-    NEEDS_FFMPEG();
     const MadeMovie whole("-f lavfi -i testsrc2=s=64x48:r=25:d=2 -c:v libx264 -bf 2 -g 25");
     const MadeMovie cut("-ss 0.6 -i " + whole.Quoted() + " -c copy");
     ExpectPacketsOfFfprobe(cut);
@@ -95,7 +92,6 @@ TEST(MovieSampleTable, HoldsAlsoWhatTheEditListHides) {
 }
 
 TEST(MovieSampleTable, CountsFramesOfLinearSound) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i sine=d=1:r=48000 -ac 2 -c:a pcm_s24le");
     const Table table = OpenTable(movie.Path());
     ncfUInt64 count = 0, position = 0, first = 0, next = 0;
@@ -116,7 +112,6 @@ TEST(MovieSampleTable, CountsFramesOfLinearSound) {
 }
 
 TEST(MovieSampleTable, TellsWhereBytesStopFollowing) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=64x48:r=25:d=2 -f lavfi -i sine=d=2 -c:v prores_ks -c:a aac");
     const Table table = OpenTable(movie.Path());
@@ -137,7 +132,6 @@ TEST(MovieSampleTable, TellsWhereBytesStopFollowing) {
 
 // Its packets tell no durations and the file tells no length.
 TEST(MovieSampleTable, LetsTheLastSampleLastAsLongAsTheOneBefore) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=20:d=0.5 -c:v flv", ".flv");
     const Table table = OpenTable(movie.Path());
     ncfUInt64 count = 0;
@@ -155,7 +149,6 @@ TEST(MovieSampleTable, LetsTheLastSampleLastAsLongAsTheOneBefore) {
 }
 
 TEST(MovieSampleTable, RefusesNumbersThatThereAreNot) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -c:v mpeg4");
     const Table table = OpenTable(movie.Path());
     ncfUInt64 value = 77;

@@ -34,7 +34,6 @@ protected:
 
 // Lists open none of the files they name, not even those beside them.
 TEST_F(OpenInput, ReachesNoOtherFile) {
-    NEEDS_FFMPEG();
     Make("beside.wav", "-f lavfi -i sine=d=0.2", ".wav");
     Make("beside.ts", "-f lavfi -i testsrc2=s=64x48:r=25:d=0.2", ".ts");
     std::string reason;
@@ -48,7 +47,6 @@ TEST_F(OpenInput, ReachesNoOtherFile) {
 
 // A name that looks like a pattern for many pictures is the name of one file.
 TEST_F(OpenInput, TakesNamesAsTheyAre) {
-    NEEDS_FFMPEG();
     for (const char* const name : {"shot%03d.png", "shot*.png", "a:b ?#.png", "http:x.png"}) {
         const auto file = Make(name, "-f lavfi -i testsrc2=s=64x48 -frames:v 1", ".png");
         Make("shot001.png", "-f lavfi -i testsrc2=s=32x32 -frames:v 1", ".png");
@@ -72,7 +70,6 @@ TEST_F(OpenInput, RefusesWhatIsNoFile) {
 }
 
 TEST_F(OpenInput, LeavesNothingOpen) {
-    NEEDS_FFMPEG();
     const auto opened = [] {
         return std::distance(std::filesystem::directory_iterator("/proc/self/fd"), {});
     };

@@ -88,7 +88,6 @@ class MadePalettes : public testing::TestWithParam<Made> {};
 // AVI alone can change the palette from frame to frame; in the other containers
 // the pictures keep the first or carry their own.
 TEST_P(MadePalettes, AreThoseOfFfmpegInEveryOrder) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(std::string("-f lavfi -i testsrc2=s=64x48:r=5 -filter_complex "
                                       "\"split[a][b];[a]palettegen=stats_mode=single[p];"
                                       "[b][p]paletteuse=new=1\" -pix_fmt pal8 -frames:v 9 ") +
@@ -213,7 +212,6 @@ constexpr Written kWritten[] = {
 class WrittenPalettes : public testing::TestWithParam<Written> {};
 
 TEST_P(WrittenPalettes, AreThoseOfFfmpegInEveryOrder) {
-    NEEDS_FFMPEG();
     movies::VideoFormat format;
     format.codec = GetParam().codec;
     format.width = kWidth;

@@ -17,7 +17,6 @@ std::unique_ptr<host::PictureReader> Open(const MadeMovie& movie) {
 constexpr ncfUInt64 kAhead = 80;
 
 TEST(PictureReader, DecodesEachPacketOnceGoingForward) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=8 -c:v libx264 -bf 2 -g 50");
     const auto reader = Open(movie);
     ASSERT_TRUE(reader);
@@ -29,7 +28,6 @@ TEST(PictureReader, DecodesEachPacketOnceGoingForward) {
 }
 
 TEST(PictureReader, DecodesAGroupOnceForStepsBackWithinIt) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=8 -c:v libx264 -bf 2 -g 200");
     const auto reader = Open(movie);
     ASSERT_TRUE(reader);
@@ -43,7 +41,6 @@ TEST(PictureReader, DecodesAGroupOnceForStepsBackWithinIt) {
 }
 
 TEST(PictureReader, JumpsToTheNearestSyncSample) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=64x48:r=25:d=20 -c:v libx264 -bf 2 -g 25 -threads 1");
     const auto reader = Open(movie);
@@ -56,7 +53,6 @@ TEST(PictureReader, JumpsToTheNearestSyncSample) {
 }
 
 TEST(PictureCache, KeepsThoseNearestWithinItsMemory) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=1 -c:v prores_ks");
     const auto reader = Open(movie);
     std::shared_ptr<const AVFrame> frame;
@@ -79,7 +75,6 @@ TEST(PictureCache, KeepsThoseNearestWithinItsMemory) {
 }
 
 TEST(PictureReader, GivesDecoderAndKeptPicturesBackAndMakesThemAnew) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=96x64:r=25:d=1 -c:v libx264 -bf 2 -g 12 -pix_fmt yuv420p");
     const auto reader = Open(movie);

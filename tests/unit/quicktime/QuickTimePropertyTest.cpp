@@ -15,7 +15,6 @@ using namespace quicktime_tests;
 namespace {
 
 TEST(QuickTimeProperty, NamesPixelFormatsInTheCodecsOrder) {
-    NEEDS_FFMPEG();
     const std::vector<ncfUInt32> deep = {Code("2vuy"), Code("r4fl"), Code("v210"), Code("b64a"),
                                          Code("BGRA")};
     struct Row {
@@ -51,7 +50,6 @@ TEST(QuickTimeProperty, NamesPixelFormatsInTheCodecsOrder) {
 }
 
 TEST(QuickTimeProperty, NamesNoneForSoundAlone) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i sine=d=0.2 -c:a pcm_s16le");
     const auto property = host::MakeRef<host::QuickTimeProperty>();
     ASSERT_EQ(property->CreateMovie(host::ModulePath(movie.Path()).get()), NCF_OK);
@@ -63,7 +61,6 @@ TEST(QuickTimeProperty, NamesNoneForSoundAlone) {
 
 // Who asks while another opens the movie again waits for it.
 TEST(QuickTimeProperty, AnswersOnSeveralThreads) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=0.2 -c:v libx264 -pix_fmt yuv420p");
     const auto property = host::MakeRef<host::QuickTimeProperty>();
     const auto path = host::ModulePath(movie.Path());

@@ -30,7 +30,6 @@ Length Ask(const Wrapper& wrapper, double forced, double editor, ncfUInt32 singl
 }
 
 TEST(QuickTimeWrapper, TellsRateAndLengthOfVideo) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=64x48:r=30000/1001:d=2 -f lavfi -i sine=d=1:r=48000 -c:v mpeg4 "
         "-c:a pcm_s16le");
@@ -53,7 +52,6 @@ TEST(QuickTimeWrapper, TellsRateAndLengthOfVideo) {
 }
 
 TEST(QuickTimeWrapper, GivesAStillTheLengthAskedFor) {
-    NEEDS_FFMPEG();
     const MadeMovie still("-f lavfi -i testsrc2=s=64x48 -frames:v 1", ".png");
     const Wrapper wrapper = OpenWrapper(still.Path());
     ASSERT_TRUE(wrapper);
@@ -66,7 +64,6 @@ TEST(QuickTimeWrapper, GivesAStillTheLengthAskedFor) {
 }
 
 TEST(QuickTimeWrapper, TakesTheEditorsRateForSoundAlone) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i sine=d=2.03:r=48000 -c:a pcm_s16le");
     const Wrapper wrapper = OpenWrapper(movie.Path());
     ASSERT_TRUE(wrapper);
@@ -83,7 +80,6 @@ TEST(QuickTimeWrapper, TakesTheEditorsRateForSoundAlone) {
 
 // The header's length is that of the longest track, which need not be the first.
 TEST(QuickTimeWrapper, CountsByTheFirstTrackOrByTheHeaderAsAsked) {
-    NEEDS_FFMPEG();
     for (const char* first : {"testsrc2=s=64x48:r=25:d=1", "sine=d=1:r=48000"}) {
         const MadeMovie movie(std::string("-f lavfi -i ") + first +
                               " -f lavfi -i sine=d=2:r=48000 -map 0 -map 1 -c:v mpeg4 -c:a "
@@ -96,7 +92,6 @@ TEST(QuickTimeWrapper, CountsByTheFirstTrackOrByTheHeaderAsAsked) {
 }
 
 TEST(QuickTimeWrapper, NoticesTracksThatDisagreeWithTheLength) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=64x48:r=25:d=2 -f lavfi -i sine=d=1:r=48000 -c:v mpeg4 -c:a "
         "pcm_s16le");
@@ -114,7 +109,6 @@ TEST(QuickTimeWrapper, NoticesTracksThatDisagreeWithTheLength) {
 }
 
 TEST(QuickTimeWrapper, TellsFieldsByTheirFirst) {
-    NEEDS_FFMPEG();
     struct Row {
         const char* order;
         ncfUInt32 interlaced, bits;
@@ -141,7 +135,6 @@ TEST(QuickTimeWrapper, TellsFieldsByTheirFirst) {
 }
 
 TEST(QuickTimeWrapper, TellsTheMatrixOfTheCodec) {
-    NEEDS_FFMPEG();
     struct Row {
         const char* matrix;
         ncfBool is709, is601;
@@ -159,7 +152,6 @@ TEST(QuickTimeWrapper, TellsTheMatrixOfTheCodec) {
 }
 
 TEST(QuickTimeWrapper, SeesAlphaInContainerAndPicture) {
-    NEEDS_FFMPEG();
     struct Row {
         const char* arguments;
         const char* ending;
@@ -184,7 +176,6 @@ TEST(QuickTimeWrapper, SeesAlphaInContainerAndPicture) {
 }
 
 TEST(QuickTimeWrapper, TellsTimecode) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=64x48:r=30000/1001:d=1 -c:v mpeg4 -timecode 10:59:58\\;17");
     const Wrapper wrapper = OpenWrapper(movie.Path());
@@ -211,7 +202,6 @@ TEST(QuickTimeWrapper, TellsTimecode) {
 }
 
 TEST(QuickTimeWrapper, DescribesTracks) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=720x480:r=25:d=1 -f lavfi -i testsrc2=s=64x48:r=25:d=1 "
         "-f lavfi -i sine=d=1:r=48000 -map 0 -map 1 -map 2 -c:v prores_ks -vendor apl0 "
@@ -264,7 +254,6 @@ TEST(QuickTimeWrapper, DescribesTracks) {
 
 // A media data reference without its flag names another file.
 TEST(QuickTimeWrapper, NoticesMediaInOtherFiles) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -c:v mpeg4");
     Bytes content = movie.Content();
     const std::string text(content.begin(), content.end());
@@ -279,7 +268,6 @@ TEST(QuickTimeWrapper, NoticesMediaInOtherFiles) {
 
 // Readers open the file for themselves.
 TEST(QuickTimeWrapper, MayGoBeforeItsReaders) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -c:v mpeg4");
     const auto reader = OpenVideo(movie.Path(), Code("2vuy"));  // its wrapper has gone
     ASSERT_TRUE(reader);

@@ -47,14 +47,12 @@ protected:
 };
 
 TEST_P(EveryRaster, IsFineAsItIs) {
-    NEEDS_FFMPEG();
     EXPECT_EQ(ClaimOf(movie), "");
     EXPECT_EQ(ClaimOf(Retold(movie, 80, 48)), "") << "a little more";
     EXPECT_EQ(ClaimOf(Retold(movie, 4096, 4096)), "") << "as large as is always fine";
 }
 
 TEST_P(EveryRaster, CantBeFarLargerThanTheSamplesHold) {
-    NEEDS_FFMPEG();
     const MadeMovie retold = Retold(movie, 16384, 8640);
     const std::string claim = ClaimOf(retold);
     EXPECT_EQ(claim.find("the file claims pictures of 16384 x 8640, "), 0u) << claim;
@@ -66,7 +64,6 @@ INSTANTIATE_TEST_SUITE_P(RasterClaim, EveryRaster, testing::ValuesIn(kEncoders),
 
 // One colour packs best.
 TEST(RasterClaim, OfLargePicturesOfOneColourIsTrue) {
-    NEEDS_FFMPEG();
     for (const char* const encoder :
          {"libx264 -preset ultrafast", "mjpeg", "png -pred none", "qtrle"}) {
         SCOPED_TRACE(encoder);
@@ -78,7 +75,6 @@ TEST(RasterClaim, OfLargePicturesOfOneColourIsTrue) {
 }
 
 TEST(RasterClaim, OfLargePicturesIsSeenInTheHeader) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc=s=64x48:r=25 -f lavfi -i sine -t 0.1 -c:v mpeg4",
                           ".mov");
     EXPECT_FALSE(host::TellsLargePictures(movie.Path()));
@@ -88,7 +84,6 @@ TEST(RasterClaim, OfLargePicturesIsSeenInTheHeader) {
 
 // The library would take the size that the samples tell.
 TEST(RasterClaim, OfMpeg4IsThatOfItsDescription) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc=s=64x48:r=25 -frames:v 3 -c:v mpeg4", ".mov");
     const MadeMovie retold = Retold(movie, 80, 60);
     std::string reason;
@@ -101,7 +96,6 @@ TEST(RasterClaim, OfMpeg4IsThatOfItsDescription) {
 
 // The decoder is told how much it may ask for, so that nothing is allocated.
 TEST(RasterClaim, IsABoundForTheDecoderToo) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i color=s=4800x4800:r=25 -frames:v 1 -c:v mjpeg");
     const MadeMovie retold = Retold(movie, 64, 48);
     EXPECT_EQ(host::FindImpossibleRaster(retold.Path(), 0),

@@ -112,7 +112,6 @@ TEST(TrackNumbers, ServeTheReadersToo) {
 }
 
 TEST(TrackNumbers, CountStreamsOfOtherContainers) {
-    NEEDS_FFMPEG();
     for (const char* const ending : {".ts", ".mpg", ".avi", ".mkv"}) {
         const MadeMovie movie(
             "-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -f lavfi -i sine=d=0.4:r=48000 -c:v "
@@ -126,7 +125,6 @@ TEST(TrackNumbers, CountStreamsOfOtherContainers) {
 // A picture on the sleeve is no picture track, and takes no number that the
 // movie gives.
 TEST(TrackNumbers, LeavePicturesAttachedToSoundAside) {
-    NEEDS_FFMPEG();
     for (const char* const ending : {".m4a", ".mp3"}) {
         const MadeMovie movie(
             "-f lavfi -i sine=d=0.4:r=48000 -f lavfi -i testsrc2=s=64x48:r=25:d=0.04 -map 0 -map 1 "
@@ -384,7 +382,6 @@ TEST(TrackDescriptions, GiveTimecodeOnlyWhereItCounts) {
 
 // The container's size and not the codec's, whatever was asked before.
 TEST(TrackDescriptions, KeepTheBoxOfTheMovie) {
-    NEEDS_FFMPEG();
     const MadeMovie made("-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -c:v mjpeg -movflags +faststart");
     Bytes content = made.Content();
     const std::string text(content.begin(), content.end());

@@ -68,7 +68,6 @@ TEST(UnopenedWrapper, AnswersThatNoMovieIsOpen) {
 }
 
 TEST(UnopenedWrapper, ForgetsTheMovieBeforeAFailure) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=0.4 -c:v mpeg4");
     const auto wrapper = OpenWrapper(movie.Path());
     ASSERT_TRUE(wrapper);

@@ -51,7 +51,6 @@ Bytes AllOf(const MadeMovie& movie, const char (&layout)[5], ncfUInt64* count = 
 }
 
 TEST(VideoReader, DeliversEightBit422AsItWasStored) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(std::string(kFilm) + "-c:v mpeg2video -pix_fmt yuv422p -q:v 2 -bf 2");
     ncfUInt64 count = 0;
     ExpectEqual(AllOf(movie, "2vuy", &count), movie.Decoded("-f rawvideo -pix_fmt uyvy422"));
@@ -59,13 +58,11 @@ TEST(VideoReader, DeliversEightBit422AsItWasStored) {
 }
 
 TEST(VideoReader, DeliversTenBit422AsItWasStored) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=100x64:r=25:d=0.4 -c:v prores_ks -profile:v 3");
     ExpectEqual(AllOf(movie, "v210"), movie.Decoded("-f rawvideo -c:v v210"));
 }
 
 TEST(VideoReader, DeliversUncompressedFilesAsTheyWereStored) {
-    NEEDS_FFMPEG();
     const MadeMovie v210(std::string(kFilm) + "-c:v v210");
     ExpectEqual(AllOf(v210, "v210"), v210.Decoded("-f rawvideo -c:v v210"));
     const MadeMovie uyvy(std::string(kFilm) + "-c:v rawvideo -pix_fmt uyvy422");
@@ -73,7 +70,6 @@ TEST(VideoReader, DeliversUncompressedFilesAsTheyWereStored) {
 }
 
 TEST(VideoReader, DeliversEightBitRgbAsItWasStored) {
-    NEEDS_FFMPEG();
     for (const char* codec :
          {"-c:v png -pix_fmt rgba", "-c:v png -pix_fmt rgb24", "-c:v qtrle -pix_fmt argb",
           "-c:v qtrle -pix_fmt rgb24", "-c:v rawvideo -pix_fmt rgb24"}) {
@@ -87,7 +83,6 @@ TEST(VideoReader, DeliversEightBitRgbAsItWasStored) {
 }
 
 TEST(VideoReader, BringsSixteenBitRgbToVideoRangeWithFullAlpha) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=40x30:r=25:d=0.08,format=rgba64le,geq=r='X*1638':g='Y*2184':"
         "b='(X+Y)*900':a='X*1000+Y' -c:v png -pix_fmt rgba64be");
@@ -108,7 +103,6 @@ TEST(VideoReader, BringsSixteenBitRgbToVideoRangeWithFullAlpha) {
 
 // Twelve bits with alpha, nothing lost on the way into floating point.
 TEST(VideoReader, DeliversProRes4444WithAlphaInFloat) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i testsrc2=s=48x32:r=25:d=0.12,format=yuva444p10,geq=lum='64+X*15':"
         "cb='200+Y*10':cr='900-Y*10':a='X*21' -c:v prores_ks -profile:v 4 -pix_fmt yuva444p10");
@@ -132,7 +126,6 @@ TEST(VideoReader, DeliversProRes4444WithAlphaInFloat) {
 }
 
 TEST(VideoReader, MakesChromaBetweenLinesOfProgressivePicturesLinearly) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(std::string(kFilm) + "-c:v libx264 -pix_fmt yuv420p -bf 2 -g 12");
     const Bytes planes =
         movie.Decoded(std::string(kLinearPlanes) + " -f rawvideo -pix_fmt yuv422p");
@@ -140,7 +133,6 @@ TEST(VideoReader, MakesChromaBetweenLinesOfProgressivePicturesLinearly) {
 }
 
 TEST(VideoReader, MakesChromaOfInterlacedPicturesFieldByField) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(std::string(kFilm) +
                           "-vf interlace=lowpass=0 -c:v mpeg2video -flags +ildct+ilme -q:v 2 "
                           "-pix_fmt yuv420p -top 1");
@@ -153,7 +145,6 @@ TEST(VideoReader, MakesChromaOfInterlacedPicturesFieldByField) {
 }
 
 TEST(VideoReader, TurnsYuvIntoRgbByTheStreamsMatrix) {
-    NEEDS_FFMPEG();
     Bytes last;
     for (const char* matrix : {"smpte170m", "bt709"}) {
         SCOPED_TRACE(matrix);
@@ -170,7 +161,6 @@ TEST(VideoReader, TurnsYuvIntoRgbByTheStreamsMatrix) {
 
 // Rec. 601 for pictures of this size.
 TEST(VideoReader, TurnsRgbIntoYuv) {
-    NEEDS_FFMPEG();
     struct Row {
         const char* color;
         int y, cb, cr;
@@ -190,7 +180,6 @@ TEST(VideoReader, TurnsRgbIntoYuv) {
 
 // Five bits a component, packed into words.
 TEST(VideoReader, BringsFewBitsToWholeBytes) {
-    NEEDS_FFMPEG();
     for (const auto& [color, blue, green, red] :
          {std::tuple("0xFF0000", 0, 0, 255), std::tuple("0x00FF00", 0, 255, 0),
           std::tuple("0x0000FF", 255, 0, 0), std::tuple("0xFFFFFF", 255, 255, 255)}) {
@@ -206,7 +195,6 @@ TEST(VideoReader, BringsFewBitsToWholeBytes) {
 }
 
 TEST(VideoReader, BringsFullRangeToVideoRange) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i color=white:s=64x64:r=25:d=0.08,format=yuvj422p -c:v mjpeg");
     const Bytes got = AllOf(movie, "2vuy");
     ASSERT_FALSE(got.empty());
@@ -231,7 +219,6 @@ std::vector<int> TenBitNumbers(const Bytes& packed) {
 
 // Full range, chroma between lines, and RGB: none is delivered as it is stored.
 TEST(VideoReader, ConvertsToTenBitsAsToEight) {
-    NEEDS_FFMPEG();
     for (const char* codec : {"-c:v mjpeg -pix_fmt yuvj422p -q:v 2", "-c:v mjpeg -pix_fmt yuvj420p",
                               "-c:v qtrle -pix_fmt rgb24"}) {
         const MadeMovie movie(std::string(kFilm) + "-frames:v 2 " + codec);
@@ -246,7 +233,6 @@ TEST(VideoReader, ConvertsToTenBitsAsToEight) {
 }
 
 TEST(VideoReader, EndsAnOddLineWithBlueDifferenceAndLuma) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(
         "-f lavfi -i color=red:s=34x17:r=25:d=0.08,format=rgb24,crop=33:17:0:0:exact=1 -c:v png "
         "-pix_fmt rgb24");
@@ -256,7 +242,6 @@ TEST(VideoReader, EndsAnOddLineWithBlueDifferenceAndLuma) {
 }
 
 TEST(VideoReader, GivesTheSizeOfEachFormat) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=98x50:r=25:d=0.08 -c:v libx264 -pix_fmt yuv420p");
     const auto reader = OpenVideo(movie.Path(), Code("2vuy"));
     ASSERT_TRUE(reader);
@@ -276,7 +261,6 @@ TEST(VideoReader, GivesTheSizeOfEachFormat) {
 }
 
 TEST(VideoReader, StartsAndStopsAgain) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(std::string(kFilm) + "-c:v mpeg4");
     const auto reader = OpenVideo(movie.Path(), Code("2vuy"));
     ASSERT_TRUE(reader);
@@ -304,7 +288,6 @@ std::ptrdiff_t ThreadsRunning() {
 
 // A decoder has threads of its own where there are several processors.
 TEST(VideoReader, HoldsNoDecoderWhileReleased) {
-    NEEDS_FFMPEG();
     if (std::thread::hardware_concurrency() < 2) {
         GTEST_SKIP() << "one processor, no threads to count";
     }
@@ -341,7 +324,6 @@ protected:
 
 // The same pictures by any road: compared with those of the ffmpeg command.
 TEST_P(EveryCodec, GivesEachPictureInAnyOrder) {
-    NEEDS_FFMPEG();
     const MadeMovie movie(Arguments(), GetParam().ending);
     ncfUInt64 count = 0;
     const Bytes all = AllOf(movie, "2vuy", &count);
@@ -402,7 +384,6 @@ INSTANTIATE_TEST_SUITE_P(
 
 // Copying from the middle leaves an edit list that hides what comes before.
 TEST(VideoReader, NumbersFromTheFirstPictureThatTheEditListShows) {
-    NEEDS_FFMPEG();
     const MadeMovie whole(
         "-f lavfi -i testsrc2=s=96x64:r=25:d=2 -c:v libx264 -bf 2 -g 25 -pix_fmt yuv420p");
     const MadeMovie cut("-ss 0.6 -i " + whole.Quoted() + " -c copy");
@@ -418,7 +399,6 @@ TEST(VideoReader, NumbersFromTheFirstPictureThatTheEditListShows) {
 
 // Without a list of them all samples count as sync, though they are reordered.
 TEST(VideoReader, NumbersAsShownWhereNoSyncSamplesAreListed) {
-    NEEDS_FFMPEG();
     const MadeMovie listed(
         "-f lavfi -i testsrc2=s=96x64:r=25:d=2 -c:v libx264 -bf 2 -g 12 -pix_fmt yuv420p");
     Bytes content = listed.Content();
@@ -445,7 +425,6 @@ TEST(VideoReader, NumbersAsShownWhereNoSyncSamplesAreListed) {
 }
 
 TEST(VideoReader, ServesAStillPictureInAMovie) {
-    NEEDS_FFMPEG();
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48 -frames:v 1 -c:v png -pix_fmt rgb24");
     ncfUInt64 count = 0;
     ExpectEqual(AllOf(movie, "BGRA", &count), movie.Decoded("-f rawvideo -pix_fmt bgra"));
@@ -453,7 +432,6 @@ TEST(VideoReader, ServesAStillPictureInAMovie) {
 }
 
 TEST(VideoReader, BringsPicturesOfAnotherSizeToTheStreamsOwn) {
-    NEEDS_FFMPEG();
     const MadeMovie small("-f lavfi -i color=red:s=32x32:r=25:d=0.2 -c:v mjpeg -q:v 1", ".mjpeg");
     const MadeMovie large("-f lavfi -i color=red:s=64x64:r=25:d=0.2 -c:v mjpeg -q:v 1", ".mjpeg");
     Bytes joined = large.Content();
@@ -472,7 +450,6 @@ TEST(VideoReader, BringsPicturesOfAnotherSizeToTheStreamsOwn) {
 }
 
 TEST(VideoReader, FailsForABrokenPictureAlone) {
-    NEEDS_FFMPEG();
     const MadeMovie whole("-f lavfi -i testsrc2=s=96x64:r=25:d=0.4 -c:v prores_ks");
     const auto packets = whole.Probed("-show_entries packet=pos,size");
     ASSERT_EQ(packets.size(), 10u);
@@ -499,7 +476,6 @@ TEST(VideoReader, FailsForABrokenPictureAlone) {
 }
 
 TEST(VideoReader, ServesWhatACutFileStillHolds) {
-    NEEDS_FFMPEG();
     const MadeMovie whole(
         "-f lavfi -i testsrc2=s=96x64:r=25:d=1 -c:v prores_ks -movflags +faststart");
     Bytes content = whole.Content();

@@ -70,9 +70,8 @@ TEST_F(ClipDescription, GivesEssenceSlotsOneIdInAllMobs) {
         }
     }
     MoveFileMobClips(77);
-    Ptr<IAAFMobSlot> slot;
     aafSourceRef_t reference{};
-    ASSERT_EQ(AAFRESULT_SUCCESS, file_mob_->LookupSlot(3, slot.Out()));
+    Ptr<IAAFMobSlot> slot = Get(file_mob_, &IAAFMob::LookupSlot, 3);
     Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFSourceClip>(segment)->GetSourceReference(&reference));
     EXPECT_EQ(77, reference.startTime);
@@ -82,8 +81,7 @@ TEST_F(ClipDescription, PutsLaterTimecodeBetweenFillers) {
     MakeMobs();
     AddTimecode({0, 0, 30}, 2592000, 2592000, 1, 0);
     AddTimecode({1234, 1, 30}, 300, 2592000, 2, 1);
-    Ptr<IAAFMobSlot> slot;
-    ASSERT_EQ(AAFRESULT_SUCCESS, source_->LookupSlot(2, slot.Out()));
+    Ptr<IAAFMobSlot> slot = Get(source_, &IAAFMob::LookupSlot, 2);
     EXPECT_EQ(3u, Get(slot, &IAAFMobSlot::GetPhysicalNum));
     Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
     EXPECT_EQ(3u, Get(As<IAAFSequence>(segment), &IAAFSequence::CountComponents));
@@ -101,20 +99,18 @@ TEST_F(ClipDescription, HoldsPictureAndSoundInOneDescriptor) {
     EXPECT_EQ(3u, count);
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFFileDescriptor>(multiple_)->GetSampleRate(&rate));
     EXPECT_EQ(30000, rate.numerator);
-    Ptr<IAAFFileDescriptor> last;
-    ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->GetFileDescriptorAt(2, last.Out()));
+    Ptr<IAAFFileDescriptor> last = Get(multiple_, &IAAFMultipleDescriptor::GetFileDescriptorAt, 2);
     EXPECT_EQ(1536000u, Get(As<IAAFPCMDescriptor>(last), &IAAFPCMDescriptor::GetAverageBPS));
 }
 
 TEST_F(ClipDescription, KeepsTheBoxesOfAPicture) {
     MakeMobs();
     AddPicture();
-    Ptr<IAAFFileDescriptor> picture;
-    ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->GetFileDescriptorAt(0, picture.Out()));
-    Ptr<IAAFClassDef> pictures;
+    Ptr<IAAFFileDescriptor> picture =
+        Get(multiple_, &IAAFMultipleDescriptor::GetFileDescriptorAt, 0);
     Ptr<IAAFPropertyDef> property;
-    ASSERT_EQ(AAFRESULT_SUCCESS,
-              dictionary_->LookupClassDef(AUID_AAFCDCIDescriptor, pictures.Out()));
+    Ptr<IAAFClassDef> pictures =
+        Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor);
     ASSERT_EQ(AAFRESULT_SUCCESS,
               pictures->LookupPropertyDef(ncfGuid("0E040101-0101-0106-060E-2B3401010101"),
                                           property.Out()));

@@ -86,10 +86,9 @@ TEST_F(SaveCopy, WritesAFileThatReadsBackWhole) {
               TextOf<IAAFLocator>(locator, &IAAFLocator::GetPathBufLen, &IAAFLocator::GetPath));
 
     // The extensions came along.
-    Ptr<IAAFClassDef> pictures;
     Ptr<IAAFPropertyDef> property;
-    ASSERT_EQ(AAFRESULT_SUCCESS,
-              dictionary->LookupClassDef(AUID_AAFCDCIDescriptor, pictures.Out()));
+    Ptr<IAAFClassDef> pictures =
+        Get(dictionary, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor);
     ASSERT_EQ(AAFRESULT_SUCCESS,
               pictures->LookupPropertyDef(ncfGuid("0E040101-0101-010E-060E-2B3401010101"),
                                           property.Out()));
