@@ -4,8 +4,8 @@
 
 #include "aaf_library/model/Object.h"
 #include "aaf_library/model/TypeDefinition.h"
-#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFComponents.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "not_implemented/AAFMobSlots.h"
 
 namespace aaf {
