@@ -21,9 +21,8 @@ TEST_F(ClassDefinitions, LookupSearchesParentsButNotSubclasses) {
 
 TEST_F(ClassDefinitions, NewOptionalPropertyIsOptionalNotUniqueAndFound) {
     const auto type = Type(kAAFTypeID_Int32);
-    const auto property = Out<IAAFPropertyDef>([&](IAAFPropertyDef** out) {
-        return Class(AUID_AAFMob)->RegisterOptionalPropertyDef(kOwnId, L"Own", type.get(), out);
-    });
+    const auto property = Out(Class(AUID_AAFMob), &IAAFClassDef::RegisterOptionalPropertyDef,
+                              kOwnId, L"Own", type.get());
     aafBoolean_t optional = kAAFFalse;
     aafBoolean_t unique = kAAFTrue;
     wchar_t name[8] = {};
@@ -34,8 +33,7 @@ TEST_F(ClassDefinitions, NewOptionalPropertyIsOptionalNotUniqueAndFound) {
     EXPECT_EQ(unique, kAAFFalse);
     EXPECT_STREQ(name, L"Own");
     EXPECT_EQ(PropertyOf(AUID_AAFMasterMob, kOwnId).get(), property.get());
-    EXPECT_EQ(Out<IAAFTypeDef>([&](IAAFTypeDef** out) { return property->GetTypeDef(out); }).get(),
-              type.get());
+    EXPECT_EQ(Out(property, &IAAFPropertyDef::GetTypeDef).get(), type.get());
 }
 
 TEST_F(ClassDefinitions, OptionalPropertyMayBeRegisteredWithoutOutput) {
@@ -48,9 +46,8 @@ TEST_F(ClassDefinitions, OptionalPropertyMayBeRegisteredWithoutOutput) {
 
 TEST_F(ClassDefinitions, SecondRegistrationOnTheSameClassIsRefusedAndTheFirstStays) {
     const auto type = Type(kAAFTypeID_Int32);
-    const auto first = Out<IAAFPropertyDef>([&](IAAFPropertyDef** out) {
-        return Class(AUID_AAFMob)->RegisterOptionalPropertyDef(kOwnId, L"Own", type.get(), out);
-    });
+    const auto first = Out(Class(AUID_AAFMob), &IAAFClassDef::RegisterOptionalPropertyDef, kOwnId,
+                           L"Own", type.get());
     IAAFPropertyDef* out = first.get();
     EXPECT_EQ(Class(AUID_AAFMob)->RegisterOptionalPropertyDef(kOwnId, L"Other", type.get(), &out),
               AAFRESULT_INVALID_PARAM);
@@ -160,8 +157,7 @@ TEST_F(ClassDefinitions, OwnClassIsMadeAfterRegistration) {
     ASSERT_EQ(dictionary->RegisterClassDef(own.get()), AAFRESULT_SUCCESS);
     EXPECT_EQ(dictionary->RegisterClassDef(own.get()), AAFRESULT_OBJECT_ALREADY_ATTACHED);
     const auto made = New(kOwnId);
-    EXPECT_EQ(Out<IAAFClassDef>([&](IAAFClassDef** def) { return made->GetDefinition(def); }).get(),
-              own.get());
+    EXPECT_EQ(Out(made, &IAAFObject::GetDefinition).get(), own.get());
     aafBoolean_t present = kAAFTrue;
     EXPECT_EQ(made->IsPropertyPresent(PropertyOf(kOwnId, kOtherOwnId).get(), &present),
               AAFRESULT_SUCCESS);

@@ -8,8 +8,7 @@ namespace {
 class DataDefinitions : public ModelFixture {
 protected:
     Ptr<IAAFDataDef3> Find(const aafUID_t& id) {
-        return As<IAAFDataDef3>(Out<IAAFDataDef>(
-            [&](IAAFDataDef** out) { return dictionary->LookupDataDef(id, out); }));
+        return As<IAAFDataDef3>(Out(dictionary, &IAAFDictionary::LookupDataDef, id));
     }
     bool Converts(const aafUID_t& from, const aafUID_t& to) {
         aafBoolean_t result = -1;

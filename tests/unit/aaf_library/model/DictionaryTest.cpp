@@ -34,16 +34,15 @@ TEST_F(DictionaryOfAFile, StartsWithTheBuiltInDefinitions) {
 }
 
 TEST_F(DictionaryOfAFile, BuiltInDefinitionsHaveNameAndDescription) {
-    const auto definition = As<IAAFDefObject>(Out<IAAFDataDef>(
-        [&](IAAFDataDef** out) { return dictionary->LookupDataDef(kAAFDataDef_Picture, out); }));
+    const auto definition =
+        As<IAAFDefObject>(Out(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Picture));
     wchar_t text[40] = {};
     EXPECT_EQ(definition->GetName(text, sizeof text), AAFRESULT_SUCCESS);
     EXPECT_STREQ(text, L"DataDef_Picture");
     EXPECT_EQ(definition->GetDescription(text, sizeof text), AAFRESULT_SUCCESS);
     EXPECT_STREQ(text, L"Picture data");
-    const auto container = Out<IAAFContainerDef>([&](IAAFContainerDef** out) {
-        return dictionary->LookupContainerDef(ncfGuid("4313B571-D8BA-11D2-809B-006008143E6F"), out);
-    });
+    const auto container = Out(dictionary, &IAAFDictionary::LookupContainerDef,
+                               ncfGuid("4313B571-D8BA-11D2-809B-006008143E6F"));
     EXPECT_EQ(As<IAAFDefObject>(container)->GetDescription(text, sizeof text), AAFRESULT_SUCCESS);
     EXPECT_STREQ(text, L"");
     aafBoolean_t identified = -1;
@@ -122,9 +121,8 @@ TEST_F(DictionaryOfAFile, SecondTypeWithAnIdIsAcceptedAndNotEntered) {
     ASSERT_EQ(mob->RegisterOptionalPropertyDef(kOtherOwnId, L"Own", Type(kOwnId).get(), nullptr),
               AAFRESULT_SUCCESS);
     aafInt32 number = 17;
-    const auto value = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return second->CreateValue(reinterpret_cast<aafMemPtr_t>(&number), 4, out);
-    });
+    const auto value =
+        Out(second, &IAAFTypeDefInt::CreateValue, reinterpret_cast<aafMemPtr_t>(&number), 4);
     const auto object = New(AUID_AAFMasterMob);
     EXPECT_EQ(object->SetPropertyValue(PropertyOf(AUID_AAFMob, kOtherOwnId).get(), value.get()),
               AAFRESULT_SUCCESS);
@@ -149,10 +147,7 @@ TEST_F(DictionaryOfAFile, ContainerDefinitionsRegisterOnce) {
     ASSERT_EQ(twin->Initialize(kOwnId, L"Twin", L""), AAFRESULT_SUCCESS);
     EXPECT_EQ(dictionary->RegisterContainerDef(twin.get()), AAFRESULT_SUCCESS);
     EXPECT_EQ(Get(dictionary, &IAAFDictionary::CountContainerDefs), 94u);
-    EXPECT_EQ(Out<IAAFContainerDef>([&](IAAFContainerDef** out) {
-                  return dictionary->LookupContainerDef(kOwnId, out);
-              }).get(),
-              own.get());
+    EXPECT_EQ(Out(dictionary, &IAAFDictionary::LookupContainerDef, kOwnId).get(), own.get());
     EXPECT_EQ(dictionary->RegisterContainerDef(nullptr), AAFRESULT_NULL_PARAM);
 }
 

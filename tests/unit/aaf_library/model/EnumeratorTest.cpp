@@ -9,12 +9,9 @@ namespace {
 
 class Enumerators : public ModelFixture {
 protected:
-    Ptr<IEnumAAFDataDefs> list =
-        Out<IEnumAAFDataDefs>([&](IEnumAAFDataDefs** out) { return dictionary->GetDataDefs(out); });
+    Ptr<IEnumAAFDataDefs> list = Out(dictionary, &IAAFDictionary::GetDataDefs);
 
-    Ptr<IAAFDataDef> Next() {
-        return Out<IAAFDataDef>([&](IAAFDataDef** out) { return list->NextOne(out); });
-    }
+    Ptr<IAAFDataDef> Next() { return Out(list, &IEnumAAFDataDefs::NextOne); }
 };
 
 TEST_F(Enumerators, NextOneWalksToTheEndAndLeavesTheOutputAlone) {
@@ -59,12 +56,10 @@ TEST_F(Enumerators, SkipPastTheEndIsRefused) {
 
 TEST_F(Enumerators, CloneGoesOnFromTheSamePlaceOnItsOwn) {
     Next();
-    const auto clone =
-        Out<IEnumAAFDataDefs>([&](IEnumAAFDataDefs** out) { return list->Clone(out); });
+    const auto clone = Out(list, &IEnumAAFDataDefs::Clone);
     const auto second = Next();
     Next();
-    EXPECT_EQ(Out<IAAFDataDef>([&](IAAFDataDef** out) { return clone->NextOne(out); }).get(),
-              second.get());
+    EXPECT_EQ(Out(clone, &IEnumAAFDataDefs::NextOne).get(), second.get());
     EXPECT_EQ(list->Clone(nullptr), AAFRESULT_NULL_PARAM);
 }
 
@@ -79,8 +74,7 @@ TEST_F(Enumerators, ElementsAddedWhileItRunsAreMet) {
 }
 
 TEST_F(Enumerators, EmptyListIsGivenAndEndsAtOnce) {
-    const auto codecs = Out<IEnumAAFCodecDefs>(
-        [&](IEnumAAFCodecDefs** out) { return dictionary->GetCodecDefs(out); });
+    const auto codecs = Out(dictionary, &IAAFDictionary::GetCodecDefs);
     IAAFCodecDef* out = nullptr;
     EXPECT_EQ(codecs->NextOne(&out), AAFRESULT_NO_MORE_OBJECTS);
 }
@@ -89,14 +83,12 @@ TEST_F(Enumerators, ClassesTypesAndPropertiesAreWalkedToo) {
     aafUInt32 wanted = 0;
     aafUInt32 met = 0;
     dictionary->CountTypeDefs(&wanted);
-    const auto types =
-        Out<IEnumAAFTypeDefs>([&](IEnumAAFTypeDefs** out) { return dictionary->GetTypeDefs(out); });
+    const auto types = Out(dictionary, &IAAFDictionary::GetTypeDefs);
     for (IAAFTypeDef* out = nullptr; types->NextOne(&out) == AAFRESULT_SUCCESS; ++met) {
         out->Release();
     }
     EXPECT_EQ(met, wanted);
-    const auto properties = Out<IEnumAAFPropertyDefs>(
-        [&](IEnumAAFPropertyDefs** out) { return Class(AUID_AAFFiller)->GetPropertyDefs(out); });
+    const auto properties = Out(Class(AUID_AAFFiller), &IAAFClassDef::GetPropertyDefs);
     IAAFPropertyDef* none = nullptr;
     EXPECT_EQ(properties->NextOne(&none), AAFRESULT_NO_MORE_OBJECTS);
 }

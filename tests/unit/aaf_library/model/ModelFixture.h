@@ -4,6 +4,9 @@
 
 #include <gtest/gtest.h>
 
+#include <tuple>
+#include <type_traits>
+
 #include "aaf_library/model/ClassDefinition.h"
 #include "aaf_library/model/Dictionary.h"
 #include "aaf_library/model/Model.h"
@@ -29,7 +32,16 @@ protected:
     aaf::RefPtr<aaf::Model> model = aaf::Model::Create(Registry());
     IAAFDictionary* dictionary = &model->dictionary();
 
-    // Calls an operation whose last argument is an interface output.
+    // What an operation gives whose last argument is an interface output.
+    template <class Object, class Interface, class... Parameters, class... Given>
+    static auto Out(const Object& object, HRESULT (Interface::*operation)(Parameters...),
+                    Given... given) {
+        using Last = std::tuple_element_t<sizeof...(Given), std::tuple<Parameters...>>;
+        using I = std::remove_pointer_t<std::remove_pointer_t<Last>>;
+        I* out = nullptr;
+        EXPECT_EQ(((*object).*operation)(given..., &out), AAFRESULT_SUCCESS);
+        return Ptr<I>::Adopt(out);
+    }
     template <class I, class Call>
     static Ptr<I> Out(Call call) {
         I* out = nullptr;
@@ -46,8 +58,7 @@ protected:
     }
 
     Ptr<IAAFTypeDef> Type(const aafUID_t& id) {
-        return Out<IAAFTypeDef>(
-            [&](IAAFTypeDef** out) { return dictionary->LookupTypeDef(id, out); });
+        return Out(dictionary, &IAAFDictionary::LookupTypeDef, id);
     }
     template <class I>
     Ptr<I> TypeAs(const aafUID_t& id) {
@@ -55,12 +66,10 @@ protected:
     }
 
     Ptr<IAAFClassDef> Class(const aafUID_t& id) {
-        return Out<IAAFClassDef>(
-            [&](IAAFClassDef** out) { return dictionary->LookupClassDef(id, out); });
+        return Out(dictionary, &IAAFDictionary::LookupClassDef, id);
     }
     Ptr<IAAFPropertyDef> PropertyOf(const aafUID_t& classId, const aafUID_t& id) {
-        return Out<IAAFPropertyDef>(
-            [&](IAAFPropertyDef** out) { return Class(classId)->LookupPropertyDef(id, out); });
+        return Out(Class(classId), &IAAFClassDef::LookupPropertyDef, id);
     }
 
     Ptr<IAAFObject> New(const aafUID_t& classId) {
@@ -79,9 +88,8 @@ protected:
 
     Ptr<IAAFPropertyValue> Int32Value(aafInt32 number) {
         const auto type = TypeAs<IAAFTypeDefInt>(kAAFTypeID_Int32);
-        return Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-            return type->CreateValue(reinterpret_cast<aafMemPtr_t>(&number), sizeof number, out);
-        });
+        return Out(type, &IAAFTypeDefInt::CreateValue, reinterpret_cast<aafMemPtr_t>(&number),
+                   sizeof number);
     }
     aafInt32 NumberOf(const Ptr<IAAFPropertyValue>& value) {
         aafInt32 number = -1;

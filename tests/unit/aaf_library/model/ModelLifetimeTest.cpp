@@ -15,20 +15,17 @@ using ModelLifetime = ModelFixture;
 TEST_F(ModelLifetime, ObjectAloneKeepsItsDictionaryUsable) {
     const auto object = New(AUID_AAFMasterMob);
     model = nullptr;
-    const auto held =
-        Out<IAAFDictionary>([&](IAAFDictionary** out) { return object->GetDictionary(out); });
+    const auto held = Out(object, &IAAFObject::GetDictionary);
     aafUInt32 count = 0;
     EXPECT_EQ(held->CountDataDefs(&count), AAFRESULT_SUCCESS);
     EXPECT_EQ(count, 11u);
 }
 
 TEST_F(ModelLifetime, DefinitionAloneKeepsItsModelUsable) {
-    const auto definition = Out<IAAFDataDef>(
-        [&](IAAFDataDef** out) { return dictionary->LookupDataDef(kAAFDataDef_Sound, out); });
+    const auto definition = Out(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Sound);
     model = nullptr;
     const auto object = As<IAAFObject>(definition);
-    const auto classDef =
-        Out<IAAFClassDef>([&](IAAFClassDef** out) { return object->GetDefinition(out); });
+    const auto classDef = Out(object, &IAAFObject::GetDefinition);
     aafBoolean_t concrete = kAAFFalse;
     EXPECT_EQ(classDef->IsConcrete(&concrete), AAFRESULT_SUCCESS);
     EXPECT_EQ(concrete, kAAFTrue);
@@ -37,7 +34,7 @@ TEST_F(ModelLifetime, DefinitionAloneKeepsItsModelUsable) {
 TEST_F(ModelLifetime, ValueAloneKeepsItsTypeUsable) {
     const auto value = Int32Value(5);
     model = nullptr;
-    const auto type = Out<IAAFTypeDef>([&](IAAFTypeDef** out) { return value->GetType(out); });
+    const auto type = Out(value, &IAAFPropertyValue::GetType);
     EXPECT_EQ(Get(type, &IAAFTypeDef::GetTypeCategory), kAAFTypeCatInt);
 }
 
@@ -45,12 +42,10 @@ TEST_F(ModelLifetime, UnregisteredTypeOutlivesItsHolderForTheSakeOfValues) {
     auto type = NewMeta<IAAFTypeDefInt>(AUID_AAFTypeDefInt);
     ASSERT_EQ(type->Initialize(kOwnId, 2, kAAFTrue, L"Own"), AAFRESULT_SUCCESS);
     aafInt16 number = -7;
-    const auto value = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return type->CreateValue(reinterpret_cast<aafMemPtr_t>(&number), sizeof number, out);
-    });
+    const auto value = Out(type, &IAAFTypeDefInt::CreateValue,
+                           reinterpret_cast<aafMemPtr_t>(&number), sizeof number);
     type = nullptr;
-    const auto again = As<IAAFTypeDefInt>(
-        Out<IAAFTypeDef>([&](IAAFTypeDef** out) { return value->GetType(out); }));
+    const auto again = As<IAAFTypeDefInt>(Out(value, &IAAFPropertyValue::GetType));
     aafInt16 read = 0;
     EXPECT_EQ(again->GetInteger(value.get(), reinterpret_cast<aafMemPtr_t>(&read), 2),
               AAFRESULT_SUCCESS);
@@ -61,9 +56,7 @@ TEST_F(ModelLifetime, TypeUsedBeforeItsRegistrationDoesNotHoldTheModelAfterwards
     auto type = NewMeta<IAAFTypeDefInt>(AUID_AAFTypeDefInt);
     ASSERT_EQ(type->Initialize(kOwnId, 2, kAAFTrue, L"Own"), AAFRESULT_SUCCESS);
     aafInt16 number = -7;
-    Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return type->CreateValue(reinterpret_cast<aafMemPtr_t>(&number), sizeof number, out);
-    });
+    Out(type, &IAAFTypeDefInt::CreateValue, reinterpret_cast<aafMemPtr_t>(&number), sizeof number);
     ASSERT_EQ(dictionary->RegisterTypeDef(As<IAAFTypeDef>(type).get()), AAFRESULT_SUCCESS);
     // The model's own reference and the caller's.
     EXPECT_EQ(CountOf(type), 2u);

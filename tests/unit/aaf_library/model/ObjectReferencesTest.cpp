@@ -111,8 +111,7 @@ TEST_F(ObjectReferences, SetsAreOrderedByTheBytesOfTheirKeys) {
 
 TEST_F(ObjectReferences, WeakReferenceFindsTheDictionarysDefinition) {
     const auto filler = Make(AUID_AAFFiller);
-    const auto sound = Out<IAAFDataDef>(
-        [&](IAAFDataDef** out) { return dictionary->LookupDataDef(kAAFDataDef_Sound, out); });
+    const auto sound = Out(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Sound);
     IAAFDataDef* out = nullptr;
     EXPECT_EQ(filler->ReadWeak(aaf::prop::Component_DataDefinition, &out),
               AAFRESULT_PROP_NOT_PRESENT);

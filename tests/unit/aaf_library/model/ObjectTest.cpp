@@ -17,10 +17,7 @@ protected:
         own = PropertyOf(AUID_AAFMob, kOwnId);
         mob = New(AUID_AAFMasterMob);
     }
-    Ptr<IAAFPropertyValue> Get() {
-        return Out<IAAFPropertyValue>(
-            [&](IAAFPropertyValue** out) { return mob->GetPropertyValue(own.get(), out); });
-    }
+    Ptr<IAAFPropertyValue> Get() { return Out(mob, &IAAFObject::GetPropertyValue, own.get()); }
 
     Ptr<IAAFPropertyDef> own;
     Ptr<IAAFObject> mob;
@@ -54,8 +51,7 @@ TEST_F(Objects, OneValueOnTwoObjectsBecomesACopyOnTheSecond) {
     const auto other = New(AUID_AAFMasterMob);
     ASSERT_EQ(mob->SetPropertyValue(own.get(), value.get()), AAFRESULT_SUCCESS);
     ASSERT_EQ(other->SetPropertyValue(own.get(), value.get()), AAFRESULT_SUCCESS);
-    const auto copy = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return other->GetPropertyValue(own.get(), out); });
+    const auto copy = Out(other, &IAAFObject::GetPropertyValue, own.get());
     EXPECT_NE(copy.get(), value.get());
     EXPECT_EQ(NumberOf(copy), 7);
 }
@@ -108,8 +104,7 @@ TEST_F(Objects, TypedSettersAndValuesAreTwoViewsOfOneProperty) {
     aafBoolean_t present = kAAFFalse;
     EXPECT_EQ(mob->IsPropertyPresent(name.get(), &present), AAFRESULT_SUCCESS);
     EXPECT_EQ(present, kAAFTrue);
-    const auto value = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return mob->GetPropertyValue(name.get(), out); });
+    const auto value = Out(mob, &IAAFObject::GetPropertyValue, name.get());
     aafUInt32 count = 0;
     EXPECT_EQ(TypeAs<IAAFTypeDefString>(kAAFTypeID_String)->GetCount(value.get(), &count),
               AAFRESULT_SUCCESS);
@@ -124,16 +119,10 @@ TEST_F(Objects, PropertiesAreEnumeratedWithTheirValues) {
     aafUInt32 count = 0;
     ASSERT_EQ(mob->CountProperties(&count), AAFRESULT_SUCCESS);
     EXPECT_EQ(count, 1u);
-    const auto list =
-        Out<IEnumAAFProperties>([&](IEnumAAFProperties** out) { return mob->GetProperties(out); });
-    const auto property = Out<IAAFProperty>([&](IAAFProperty** out) { return list->NextOne(out); });
-    EXPECT_EQ(Out<IAAFPropertyDef>([&](IAAFPropertyDef** out) {
-                  return property->GetDefinition(out);
-              }).get(),
-              own.get());
-    EXPECT_EQ(NumberOf(Out<IAAFPropertyValue>(
-                  [&](IAAFPropertyValue** out) { return property->GetValue(out); })),
-              9);
+    const auto list = Out(mob, &IAAFObject::GetProperties);
+    const auto property = Out(list, &IEnumAAFProperties::NextOne);
+    EXPECT_EQ(Out(property, &IAAFProperty::GetDefinition).get(), own.get());
+    EXPECT_EQ(NumberOf(Out(property, &IAAFProperty::GetValue)), 9);
     EXPECT_EQ(property->GetValue(nullptr), AAFRESULT_NULL_PARAM);
     EXPECT_EQ(property->GetDefinition(nullptr), AAFRESULT_NULL_PARAM);
 }

@@ -15,12 +15,10 @@ protected:
         TypeAs<IAAFTypeDefObjectRef>(kAAFTypeID_TaggedValueStrongReference);
 
     Ptr<IAAFPropertyValue> Empty(const Ptr<IAAFTypeDefVariableArray>& type) {
-        return Out<IAAFPropertyValue>(
-            [&](IAAFPropertyValue** out) { return type->CreateEmptyValue(out); });
+        return Out(type, &IAAFTypeDefVariableArray::CreateEmptyValue);
     }
     Ptr<IAAFPropertyValue> Reference(const Ptr<IAAFObject>& object) {
-        return Out<IAAFPropertyValue>(
-            [&](IAAFPropertyValue** out) { return reference->CreateValue(object.get(), out); });
+        return Out(reference, &IAAFTypeDefObjectRef::CreateValue, object.get());
     }
     aafUInt32 Count(const Ptr<IAAFTypeDefVariableArray>& type,
                     const Ptr<IAAFPropertyValue>& value) {
@@ -88,15 +86,13 @@ TEST_F(ArrayTypes, ArrayThatStandsInAnObjectIsFilledAfterwards) {
     ASSERT_EQ(mob->SetPropertyValue(property.get(), array.get()), AAFRESULT_SUCCESS);
     const auto element = New(AUID_AAFTaggedValue);
     ASSERT_EQ(tagged->AppendElement(array.get(), Reference(element).get()), AAFRESULT_SUCCESS);
-    const auto stored = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return mob->GetPropertyValue(property.get(), out); });
+    const auto stored = Out(mob, &IAAFObject::GetPropertyValue, property.get());
     EXPECT_EQ(Count(tagged, stored), 1u);
     EXPECT_EQ(CountOf(element), 2u);
     EXPECT_EQ(aaf::ImplementationAs<aaf::Object>(element.get())->owner(),
               aaf::ImplementationAs<aaf::Object>(mob.get()));
     // The very object comes back.
-    const auto first = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return tagged->GetElementValue(stored.get(), 0, out); });
+    const auto first = Out(tagged, &IAAFTypeDefVariableArray::GetElementValue, stored.get(), 0);
     IUnknown* object = nullptr;
     ASSERT_EQ(reference->GetObject(first.get(), IID_IAAFObject, &object), AAFRESULT_SUCCESS);
     EXPECT_EQ(static_cast<void*>(object), static_cast<void*>(element.get()));
@@ -128,12 +124,9 @@ TEST_F(ArrayTypes, ListOfOwnedObjectsCannotBeSetOnASecondObject) {
 
 TEST_F(ArrayTypes, ElementsAreEnumeratedLive) {
     const auto value = Empty(numbers);
-    const auto list = Out<IEnumAAFPropertyValues>(
-        [&](IEnumAAFPropertyValues** out) { return numbers->GetElements(value.get(), out); });
+    const auto list = Out(numbers, &IAAFTypeDefVariableArray::GetElements, value.get());
     ASSERT_EQ(numbers->AppendElement(value.get(), Int32Value(4).get()), AAFRESULT_SUCCESS);
-    EXPECT_EQ(NumberOf(Out<IAAFPropertyValue>(
-                  [&](IAAFPropertyValue** out) { return list->NextOne(out); })),
-              4);
+    EXPECT_EQ(NumberOf(Out(list, &IEnumAAFPropertyValues::NextOne)), 4);
     IAAFPropertyValue* out = nullptr;
     EXPECT_EQ(list->NextOne(&out), AAFRESULT_NO_MORE_OBJECTS);
 }
@@ -145,8 +138,7 @@ TEST_F(ArrayTypes, FixedArraysKeepTheirCount) {
     EXPECT_EQ(type->CreateValueFromCArray(bytes, 9, &out), AAFRESULT_BAD_SIZE);
     ASSERT_EQ(type->CreateValueFromCArray(bytes, 8, &out), AAFRESULT_SUCCESS);
     const auto value = Ptr<IAAFPropertyValue>::Adopt(out);
-    const auto element = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** made) { return type->GetElementValue(value.get(), 7, made); });
+    const auto element = Out(type, &IAAFTypeDefFixedArray::GetElementValue, value.get(), 7);
     ASSERT_EQ(type->SetElementValue(value.get(), 0, element.get()), AAFRESULT_SUCCESS);
     aafUInt8 read[8] = {};
     ASSERT_EQ(type->GetCArray(value.get(), read, 8), AAFRESULT_SUCCESS);
@@ -177,14 +169,12 @@ TEST_F(ArrayTypes, SetsOfObjectsAreFoundByKey) {
     const auto type = TypeAs<IAAFTypeDefSet>(kAAFTypeID_DataDefinitionStrongReferenceSet);
     aaf::PropertyValue* set = model->dictionary().FindValue(aaf::prop::Dictionary_DataDefinitions);
     aafUID_t id = kAAFDataDef_Sound;
-    const auto key = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return type->CreateKey(reinterpret_cast<aafDataBuffer_t>(&id), sizeof id, out);
-    });
+    const auto key =
+        Out(type, &IAAFTypeDefSet::CreateKey, reinterpret_cast<aafDataBuffer_t>(&id), sizeof id);
     aafBoolean_t contains = kAAFFalse;
     EXPECT_EQ(type->ContainsKey(set, key.get(), &contains), AAFRESULT_SUCCESS);
     EXPECT_EQ(contains, kAAFTrue);
-    const auto found = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return type->LookupElement(set, key.get(), out); });
+    const auto found = Out(type, &IAAFTypeDefSet::LookupElement, set, key.get());
     IUnknown* object = nullptr;
     ASSERT_EQ(TypeAs<IAAFTypeDefObjectRef>(kAAFTypeID_DataDefinitionStrongReference)
                   ->GetObject(found.get(), IID_IAAFDataDef, &object),

@@ -12,9 +12,7 @@ protected:
 };
 
 TEST_F(EnumerationTypes, MembersHaveNamesAndValues) {
-    const auto value = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return siting->CreateValueFromName(L"UnknownSiting", out);
-    });
+    const auto value = Out(siting, &IAAFTypeDefEnum::CreateValueFromName, L"UnknownSiting");
     aafInt64 number = 0;
     EXPECT_EQ(siting->GetIntegerValue(value.get(), &number), AAFRESULT_SUCCESS);
     EXPECT_EQ(number, 255);
@@ -29,8 +27,7 @@ TEST_F(EnumerationTypes, MembersHaveNamesAndValues) {
 }
 
 TEST_F(EnumerationTypes, UnknownMembersAreIllegal) {
-    const auto value = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return siting->CreateValueFromName(L"Rec601", out); });
+    const auto value = Out(siting, &IAAFTypeDefEnum::CreateValueFromName, L"Rec601");
     IAAFPropertyValue* out = nullptr;
     wchar_t name[20] = {};
     EXPECT_EQ(siting->CreateValueFromName(L"None", &out), AAFRESULT_ILLEGAL_VALUE);
@@ -50,8 +47,7 @@ TEST_F(EnumerationTypes, OwnEnumerationsAreMade) {
               AAFRESULT_BAD_TYPE);
     ASSERT_EQ(own->Initialize(kOwnId, Type(kAAFTypeID_Int16).get(), values, names, 1, L"Own"),
               AAFRESULT_SUCCESS);
-    const auto value = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return own->CreateValueFromName(L"One", out); });
+    const auto value = Out(own, &IAAFTypeDefEnum::CreateValueFromName, L"One");
     aafInt64 number = 0;
     EXPECT_EQ(own->GetIntegerValue(value.get(), &number), AAFRESULT_SUCCESS);
     EXPECT_EQ(number, -1);
@@ -65,9 +61,7 @@ TEST_F(EnumerationTypes, ExtendibleOnesGrow) {
     EXPECT_EQ(usage->AppendElement(kOwnId, L"Usage_Own"), AAFRESULT_INVALID_PARAM);
     EXPECT_EQ(usage->GetNameFromAUID(kOwnId, name, sizeof name), AAFRESULT_SUCCESS);
     EXPECT_STREQ(name, L"Usage_Own");
-    const auto value = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return usage->CreateValueFromName(L"Usage_TopLevel", out);
-    });
+    const auto value = Out(usage, &IAAFTypeDefExtEnum::CreateValueFromName, L"Usage_TopLevel");
     aafUID_t id{};
     EXPECT_EQ(usage->GetAUIDValue(value.get(), &id), AAFRESULT_SUCCESS);
     EXPECT_TRUE(id == ncfGuid("0D010102-0101-0700-060E-2B3404010101"));

@@ -11,9 +11,8 @@ protected:
 };
 
 TEST_F(IndirectTypes, WrapAndUnwrapAnyPlainValue) {
-    const auto wrapped = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return type->CreateValueFromActualValue(Int32Value(12).get(), out);
-    });
+    const auto wrapped =
+        Out(type, &IAAFTypeDefIndirect::CreateValueFromActualValue, Int32Value(12).get());
     aafUInt32 size = 0;
     aafInt32 number = 0;
     EXPECT_EQ(type->GetActualSize(wrapped.get(), &size), AAFRESULT_SUCCESS);
@@ -21,13 +20,8 @@ TEST_F(IndirectTypes, WrapAndUnwrapAnyPlainValue) {
     EXPECT_EQ(type->GetActualData(wrapped.get(), reinterpret_cast<aafMemPtr_t>(&number), 4),
               AAFRESULT_SUCCESS);
     EXPECT_EQ(number, 12);
-    EXPECT_EQ(NumberOf(Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-                  return type->GetActualValue(wrapped.get(), out);
-              })),
-              12);
-    EXPECT_EQ(Out<IAAFTypeDef>([&](IAAFTypeDef** out) {
-                  return type->GetActualType(wrapped.get(), out);
-              }).get(),
+    EXPECT_EQ(NumberOf(Out(type, &IAAFTypeDefIndirect::GetActualValue, wrapped.get())), 12);
+    EXPECT_EQ(Out(type, &IAAFTypeDefIndirect::GetActualType, wrapped.get()).get(),
               Type(kAAFTypeID_Int32).get());
 }
 
@@ -44,18 +38,15 @@ TEST_F(IndirectTypes, EmptyOrMisfittingValuesAreIllegal) {
 
 TEST_F(IndirectTypes, OpaqueValuesGiveTheirHandle) {
     const auto opaque = TypeAs<IAAFTypeDefOpaque>(kAAFTypeID_Opaque);
-    const auto wrapped = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return As<IAAFTypeDefIndirect>(opaque)->CreateValueFromActualValue(Int32Value(1).get(),
-                                                                           out);
-    });
+    const auto wrapped = Out(As<IAAFTypeDefIndirect>(opaque),
+                             &IAAFTypeDefIndirect::CreateValueFromActualValue, Int32Value(1).get());
     aafUInt32 size = 0;
     ASSERT_EQ(opaque->GetHandleBufLen(wrapped.get(), &size), AAFRESULT_SUCCESS);
     EXPECT_EQ(size, 21u);
     aafUInt8 handle[21] = {};
     EXPECT_EQ(opaque->GetHandle(wrapped.get(), 20, handle, &size), AAFRESULT_SMALLBUF);
     ASSERT_EQ(opaque->GetHandle(wrapped.get(), 21, handle, &size), AAFRESULT_SUCCESS);
-    const auto copy = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return opaque->CreateValueFromHandle(handle, 21, out); });
+    const auto copy = Out(opaque, &IAAFTypeDefOpaque::CreateValueFromHandle, handle, 21);
     aafUID_t id{};
     EXPECT_EQ(opaque->GetActualTypeID(copy.get(), &id), AAFRESULT_SUCCESS);
     EXPECT_TRUE(id == kAAFTypeID_Int32);

@@ -57,10 +57,8 @@ TEST_F(IntegerTypes, ReadingExtendsIntoLargerAndRefusesSmaller) {
 TEST_F(IntegerTypes, ValuesOfOtherKindsAreRefused) {
     const auto text = TypeAs<IAAFTypeDefString>(kAAFTypeID_String);
     wchar_t letter[] = L"a";
-    const auto value = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return text->CreateValueFromCString(reinterpret_cast<aafMemPtr_t>(letter), sizeof letter,
-                                            out);
-    });
+    const auto value = Out(text, &IAAFTypeDefString::CreateValueFromCString,
+                           reinterpret_cast<aafMemPtr_t>(letter), sizeof letter);
     aafInt32 number = 0;
     EXPECT_EQ(Get(kAAFTypeID_Int32, value, &number), AAFRESULT_BAD_TYPE);
 }
@@ -73,12 +71,9 @@ TEST_F(IntegerTypes, RenamesReadAsTheirBase) {
               AAFRESULT_SUCCESS);
     EXPECT_EQ(number, 0);
     const auto rename = TypeAs<IAAFTypeDefRename>(kAAFTypeID_LengthType);
-    EXPECT_EQ(Out<IAAFTypeDef>([&](IAAFTypeDef** out) { return rename->GetBaseType(out); }).get(),
-              Type(kAAFTypeID_Int64).get());
-    const auto base = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return rename->GetBaseValue(length.get(), out); });
-    EXPECT_EQ(Out<IAAFTypeDef>([&](IAAFTypeDef** out) { return base->GetType(out); }).get(),
-              Type(kAAFTypeID_Int64).get());
+    EXPECT_EQ(Out(rename, &IAAFTypeDefRename::GetBaseType).get(), Type(kAAFTypeID_Int64).get());
+    const auto base = Out(rename, &IAAFTypeDefRename::GetBaseValue, length.get());
+    EXPECT_EQ(Out(base, &IAAFPropertyValue::GetType).get(), Type(kAAFTypeID_Int64).get());
     IAAFPropertyValue* out = nullptr;
     EXPECT_EQ(rename->GetBaseValue(Int32Value(1).get(), &out), AAFRESULT_BAD_TYPE);
     EXPECT_EQ(rename->CreateValue(nullptr, &out), AAFRESULT_NULL_PARAM);

@@ -84,12 +84,9 @@ TEST_F(RecordTypes, LayoutOfAMemberThatGrewIsNoticed) {
 TEST_F(RecordTypes, BuiltInRecordsAreRegisteredFromTheStart) {
     const auto rational = TypeAs<IAAFTypeDefRecord>(kAAFTypeID_Rational);
     aafRational_t number{25, 1};
-    const auto value = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return rational->CreateValueFromStruct(reinterpret_cast<aafMemPtr_t>(&number),
-                                               sizeof number, out);
-    });
-    const auto numerator = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return rational->GetValue(value.get(), 0, out); });
+    const auto value = Out(rational, &IAAFTypeDefRecord::CreateValueFromStruct,
+                           reinterpret_cast<aafMemPtr_t>(&number), sizeof number);
+    const auto numerator = Out(rational, &IAAFTypeDefRecord::GetValue, value.get(), 0);
     EXPECT_EQ(NumberOf(numerator), 25);
     ASSERT_EQ(rational->SetValue(value.get(), 1, Int32Value(2).get()), AAFRESULT_SUCCESS);
     EXPECT_EQ(rational->GetStruct(value.get(), reinterpret_cast<aafMemPtr_t>(&number), 8),
@@ -102,10 +99,8 @@ TEST_F(RecordTypes, BuiltInRecordsAreRegisteredFromTheStart) {
 TEST_F(RecordTypes, PaddingOfStructuresIsNotStored) {
     const auto type = TypeAs<IAAFTypeDefRecord>(kAAFTypeID_ProductVersion);
     aafProductVersion_t version{1, 2, 3, 4, kAAFVersionBeta};
-    const auto value = Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-        return type->CreateValueFromStruct(reinterpret_cast<aafMemPtr_t>(&version), sizeof version,
-                                           out);
-    });
+    const auto value = Out(type, &IAAFTypeDefRecord::CreateValueFromStruct,
+                           reinterpret_cast<aafMemPtr_t>(&version), sizeof version);
     EXPECT_EQ(aaf::ImplementationAs<aaf::PropertyValue>(value.get())->bytes(),
               (aaf::Bytes{1, 0, 2, 0, 3, 0, 4, 0, 4}));
     aafProductVersion_t read{};
@@ -156,9 +151,7 @@ TEST_F(RecordTypes, InitializeWorksOnceAndTellsItsMembers) {
     wchar_t name[8] = {};
     EXPECT_EQ(record->GetMemberName(2, name, sizeof name), AAFRESULT_SUCCESS);
     EXPECT_STREQ(name, L"Width");
-    EXPECT_EQ(
-        Out<IAAFTypeDef>([&](IAAFTypeDef** out) { return record->GetMemberType(3, out); }).get(),
-        rational.get());
+    EXPECT_EQ(Out(record, &IAAFTypeDefRecord::GetMemberType, 3).get(), rational.get());
 }
 
 TEST_F(RecordTypes, NullArgumentsAreRefused) {

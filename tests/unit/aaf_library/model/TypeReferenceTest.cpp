@@ -17,8 +17,7 @@ protected:
 
 TEST_F(ReferenceTypes, ValueHoldsTheObjectWithoutOwningIt) {
     const auto object = New(AUID_AAFTaggedValue);
-    auto value = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return strong->CreateValue(object.get(), out); });
+    auto value = Out(strong, &IAAFTypeDefObjectRef::CreateValue, object.get());
     EXPECT_EQ(CountOf(object), 2u);
     IUnknown* out = nullptr;
     ASSERT_EQ(strong->GetObject(value.get(), IID_IAAFObject, &out), AAFRESULT_SUCCESS);
@@ -40,10 +39,8 @@ TEST_F(ReferenceTypes, ObjectOfAnotherClassIsRefused) {
 }
 
 TEST_F(ReferenceTypes, WeakValueLeadsToTheDefinition) {
-    const auto sound = Out<IAAFDataDef>(
-        [&](IAAFDataDef** out) { return dictionary->LookupDataDef(kAAFDataDef_Sound, out); });
-    const auto value = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return weak->CreateValue(sound.get(), out); });
+    const auto sound = Out(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Sound);
+    const auto value = Out(weak, &IAAFTypeDefObjectRef::CreateValue, sound.get());
     IUnknown* out = nullptr;
     ASSERT_EQ(weak->GetObject(value.get(), IID_IAAFDataDef, &out), AAFRESULT_SUCCESS);
     EXPECT_EQ(static_cast<void*>(out), static_cast<void*>(sound.get()));
@@ -53,15 +50,12 @@ TEST_F(ReferenceTypes, WeakValueLeadsToTheDefinition) {
 }
 
 TEST_F(ReferenceTypes, TypesTellTheClassOfTheirTarget) {
-    EXPECT_EQ(
-        Out<IAAFClassDef>([&](IAAFClassDef** out) { return strong->GetObjectType(out); }).get(),
-        Class(AUID_AAFTaggedValue).get());
+    EXPECT_EQ(Out(strong, &IAAFTypeDefObjectRef::GetObjectType).get(),
+              Class(AUID_AAFTaggedValue).get());
     const auto own = NewMeta<IAAFTypeDefStrongObjRef>(AUID_AAFTypeDefStrongObjRef);
     EXPECT_EQ(own->Initialize(kOwnId, nullptr, L"Own"), AAFRESULT_NULL_PARAM);
     ASSERT_EQ(own->Initialize(kOwnId, Class(AUID_AAFFiller).get(), L"Own"), AAFRESULT_SUCCESS);
-    EXPECT_EQ(Out<IAAFClassDef>([&](IAAFClassDef** out) {
-                  return As<IAAFTypeDefObjectRef>(own)->GetObjectType(out);
-              }).get(),
+    EXPECT_EQ(Out(As<IAAFTypeDefObjectRef>(own), &IAAFTypeDefObjectRef::GetObjectType).get(),
               Class(AUID_AAFFiller).get());
 }
 

@@ -9,11 +9,9 @@ class StringTypes : public ModelFixture {
 protected:
     Ptr<IAAFTypeDefString> type = TypeAs<IAAFTypeDefString>(kAAFTypeID_String);
     Ptr<IAAFPropertyValue> Make(std::wstring text) {
-        return Out<IAAFPropertyValue>([&](IAAFPropertyValue** out) {
-            return type->CreateValueFromCString(
-                reinterpret_cast<aafMemPtr_t>(&text[0]),
-                static_cast<aafUInt32>((text.size() + 1) * sizeof(wchar_t)), out);
-        });
+        return Out(type, &IAAFTypeDefString::CreateValueFromCString,
+                   reinterpret_cast<aafMemPtr_t>(&text[0]),
+                   static_cast<aafUInt32>((text.size() + 1) * sizeof(wchar_t)));
     }
 };
 
@@ -59,8 +57,7 @@ TEST_F(StringTypes, HalfACharacterIsRefused) {
 
 TEST_F(StringTypes, CharactersAreValuesOfTheirOwn) {
     const auto character = TypeAs<IAAFTypeDefCharacter>(kAAFTypeID_Character);
-    const auto value = Out<IAAFPropertyValue>(
-        [&](IAAFPropertyValue** out) { return character->CreateValueFromCharacter(L'x', out); });
+    const auto value = Out(character, &IAAFTypeDefCharacter::CreateValueFromCharacter, L'x');
     aafCharacter read = 0;
     EXPECT_EQ(character->GetCharacter(value.get(), &read), AAFRESULT_SUCCESS);
     EXPECT_EQ(read, L'x');

@@ -14,8 +14,7 @@ TEST_F(UnknownObjects, NewObjectHasOneReference) {
 }
 
 TEST_F(UnknownObjects, BothFormsOfTheRootIdGiveOnePointerUnlikeAllOthers) {
-    const auto definition = Out<IAAFDataDef>(
-        [&](IAAFDataDef** out) { return dictionary->LookupDataDef(kAAFDataDef_Picture, out); });
+    const auto definition = Out(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Picture);
     void* zero = nullptr;
     void* usual = nullptr;
     void* fromOther = nullptr;
@@ -53,8 +52,7 @@ TEST_F(UnknownObjects, RefusedInterfaceGivesNullAndThePlatformsCode) {
 }
 
 TEST_F(UnknownObjects, DataDefinitionAnswersItsWholeFamily) {
-    const auto definition = Out<IAAFDataDef>(
-        [&](IAAFDataDef** out) { return dictionary->LookupDataDef(kAAFDataDef_Sound, out); });
+    const auto definition = Out(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_Sound);
     EXPECT_TRUE(As<IAAFDataDef2>(definition));
     EXPECT_TRUE(As<IAAFDataDef3>(definition));
     EXPECT_TRUE(As<IAAFDefObject>(definition));
