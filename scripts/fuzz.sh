@@ -67,7 +67,7 @@ done
 mapfile -t new < <(ls "$findings" | grep -vxFf "$before" || true)
 for finding in "${new[@]}"; do
   # A job that is stopped at the end leaves an empty input. It counts if it fails again.
-  if [ ! -s "$findings/$finding" ] && "$build/fuzz/fuzz_${finding%%-*}" "$findings/$finding" 2>/dev/null; then
+  if [[ $finding == *-crash-* && ! -s $findings/$finding ]] && "$build/fuzz/fuzz_${finding%%-*}" "$findings/$finding" 2>/dev/null; then
     rm "$findings/$finding"
     continue
   fi

@@ -8,17 +8,17 @@ bool StoredAtoms::Next(StoredAtom& atom) {
     ncfUInt8 bytes[16];
     const ncfUInt64 left = end_ - at_;
     const ncfUInt64 known = std::min<ncfUInt64>(left, sizeof bytes);
-    if (!source_.Read(at_, bytes, known)) {
+    if (left < 8 || !source_.Read(at_, bytes, known)) {
         return false;
     }
     ByteReader reader(bytes, bytes + known);
     const AtomHead head(reader);
-    const bool endsWithParent = head.size == 0 || head.size > left;
+    const bool endsWithParent = head.IsOpen() || head.size > left;
     const ncfUInt64 size = endsWithParent ? left : head.size;
     if (!head.isWhole || size < head.length) {
         return false;
     }
-    atom = {head.type, at_ + head.length, at_ + size, head.size == 0, head.size > left};
+    atom = {head.type, at_ + head.length, at_ + size, head.IsOpen(), head.size > left};
     at_ += size;
     return true;
 }

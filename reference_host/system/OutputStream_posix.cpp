@@ -41,16 +41,18 @@ bool IsStandardOutput(const std::filesystem::path& path) {
     return DescriptorOf(path) == STDOUT_FILENO;
 }
 
-int OutputStream::Open(const std::filesystem::path& path) {
-    // A reader that goes away shows itself as a failed write, not as the end of
-    // this program.
+// A reader that goes away shows itself as a failed write, not as the end of this
+// program.
+OutputStream::OutputStream() {
     std::signal(SIGPIPE, SIG_IGN);
+}
+
+int OutputStream::Open(const std::filesystem::path& path) {
     descriptor_ = open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
     return descriptor_ < 0 ? errno : 0;
 }
 
 int OutputStream::OpenCopyOf(int descriptor) {
-    std::signal(SIGPIPE, SIG_IGN);
     descriptor_ = fcntl(descriptor, F_DUPFD_CLOEXEC, STDERR_FILENO + 1);
     return descriptor_ < 0 ? errno : 0;
 }

@@ -20,6 +20,7 @@ struct ClipDescription {
     std::tr1::shared_ptr<BaseClip> media;
     NCFSmartPtr<INCFConsole> pConsole;
     INCFComponentFactory* pComponentFactory = nullptr;
+    IAAFSmartPointer<IAAFFile> pTheAAFFile;  // released after its parts
     IAAFSmartPointer<IAAFHeader> pHeader;
     IAAFSmartPointer<IAAFDictionary> pDictionary;
     IAAFSmartPointer<IAAFMob> pMobMasterMob;

@@ -33,7 +33,6 @@ NCF_FUNCTION("NMA::Impl::NewAAFFromMovie");
 struct Description : ClipDescription {
     NMAString theMoviePathW;
     NMAString clipName;
-    IAAFSmartPointer<IAAFFile> pTheAAFFile;
     bool showsAlpha = false;
     aafPosition_t absoluteStartTime = 0;
 

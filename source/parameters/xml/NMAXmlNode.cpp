@@ -153,6 +153,9 @@ void NMAXmlNode::MarkDeleted() {
 // Only children that are new to the list are asked who they are, unless any node
 // has changed quietly: building a long list costs one look at each.
 std::size_t NMAXmlNode::findHostChild(IXmlNode* hostNode) {
+    if (children_.empty()) {
+        return 0;
+    }
     const ncfUInt64 changes = QuietChanges();
     if (hostIndexed_ == 0 || changes != hostIndexedAtChange_) {
         hostIndex_.clear();
