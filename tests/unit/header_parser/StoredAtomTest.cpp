@@ -46,7 +46,8 @@ TEST(StoredAtoms, EndWithWhatHoldsThemWhereTheyClaimMoreOrNothing) {
 TEST(StoredAtoms, StopAtWhatIsNoAtom) {
     const Bytes longHead = Box("abcd").LargeSize().ToBytes();
     for (const Bytes& bytes :
-         {Bytes(7), Bytes(longHead.begin(), longHead.end() - 1), Box("abcd").ClaimSize(7).ToBytes(),
+         {Bytes(), Bytes(7), Bytes(longHead.begin(), longHead.end() - 1),
+          Box("abcd").ClaimSize(7).ToBytes(), Box("abcd").LargeSize().ClaimSize(0).ToBytes(),
           Box("abcd").LargeSize().ClaimSize(15).ToBytes()}) {
         auto source = SourceOf(bytes);
         StoredAtom atom;
