@@ -65,7 +65,7 @@ void VisitValueInfo(NMAParamValueInfo& info) {
         return info.SetDiscreteInfo(values, count < kEnough ? count : kEnough, u32[0]);
     });
     const ncfUInt32 kind = info.GetKind();
-    info.SetKind((kind + 1) % kParamKindCount);
+    info.SetKind((kind + 1) % NMA::kParamKindCount);
     Try([&] { return info.SetSInt32Info(1, 2, 3); });
 }
 
