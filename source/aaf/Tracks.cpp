@@ -176,10 +176,20 @@ NCFRESULT AddTracksToAAF(
     CHK_PTR(absoluteStartTime);
 
     *absoluteStartTime = 0;
-    TrackMaker maker{
-        {media, pConsole, pComponentFactory, pHeader, pDictionary, pMobMasterMob, pMasterMob,
-         pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, pMultiDescriptor},
-        absoluteStartTime};
+    TrackMaker maker{{media,
+                      pConsole,
+                      pComponentFactory,
+                      {},
+                      pHeader,
+                      pDictionary,
+                      pMobMasterMob,
+                      pMasterMob,
+                      pMobFileMob,
+                      pFileMob,
+                      pMobSourceMob,
+                      pSourceMob,
+                      pMultiDescriptor},
+                     absoluteStartTime};
     return RunSteps(maker, &TrackMaker::ReadTiming, &TrackMaker::AddTimecodeSlots,
                     &TrackMaker::AddPictureSlots, &TrackMaker::AddSoundSlots);
 }
