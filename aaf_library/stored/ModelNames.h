@@ -17,7 +17,7 @@ namespace aaf::stored {
 
 std::u16string Utf16Of(const std::wstring& text);
 std::wstring WideOf(const std::u16string& text);
-// For messages, as toUtf8 of StoredNames.h.
+// For messages, as ToUtf8 of StoredNames.h.
 std::string ToUtf8(const std::wstring& text);
 
 // Form in which a property of that type is stored.

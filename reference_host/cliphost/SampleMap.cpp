@@ -187,16 +187,17 @@ std::string WordsForProperties(std::uint64_t properties) {
 
 RunMap ReadRuns(NMA::ISampleMapping& map, ncfUInt32 track, std::uint64_t fileSize) {
     RunMap found;
-    found.result = host::Guarded([&] {
+    try {
         ncfUInt64 samples = 0;
-        const NCFRESULT counted = map.GetNumberOfSamples(track, &samples);
+        found.result = map.GetNumberOfSamples(track, &samples);
         found.samples = samples;
-        Check(counted);
+        Check(found.result);
         for (std::uint64_t next = 0; next < found.samples; next += found.runs.back().count) {
             found.runs.push_back(ReadRun(map, track, next, fileSize, found));
         }
-        return counted;
-    });
+    } catch (NCFRESULT failure) {  // memory that runs out is not the movie's fault
+        found.result = failure;
+    }
     return found;
 }
 

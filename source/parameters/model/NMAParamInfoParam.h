@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/model/NMAParamValueInfo.h"
 #include "source/parameters/model/ParamItems.h"
-#include "source/parameters/model/ParamVocabulary.h"
 
 namespace NMA::XMLUtils {
 

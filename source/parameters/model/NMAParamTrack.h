@@ -2,11 +2,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/model/NMAParamInfos.h"
 #include "source/parameters/model/NMAParamSet.h"
 #include "source/parameters/model/ParamItems.h"
 #include "source/parameters/model/ParamText.h"
-#include "source/parameters/model/ParamVocabulary.h"
 
 namespace NMA::XMLUtils {
 

@@ -2,10 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/model/NMAParamElement.h"
 #include "source/parameters/model/ParamItems.h"
 #include "source/parameters/model/ParamText.h"
-#include "source/parameters/model/ParamVocabulary.h"
 
 namespace NMA::XMLUtils {
 

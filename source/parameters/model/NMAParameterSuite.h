@@ -2,9 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/model/NMAParamComponent.h"
 #include "source/parameters/model/ParamItems.h"
-#include "source/parameters/model/ParamVocabulary.h"
 #include "source/parameters/xml/NMAXmlDoc.h"
 
 namespace NMA::XMLUtils {

@@ -5,8 +5,8 @@
 
 #include <memory>
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/parameters/model/ParamText.h"
-#include "source/parameters/model/ParamVocabulary.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::XMLUtils {

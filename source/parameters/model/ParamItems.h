@@ -6,7 +6,7 @@
 
 // What the typed classes of the parameter document share: element children that
 // are addressed by index or by an attribute, and children that hold a text.
-// Names are of ParamVocabulary.h. Failures are thrown.
+// Names are of DocumentWords.h. Failures are thrown.
 namespace NMA::XMLUtils {
 
 // The attribute by which an item is found among its kind; case does not count.
