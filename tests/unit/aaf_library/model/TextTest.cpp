@@ -15,6 +15,17 @@ TEST(StoredTexts, CharactersBeyondTheBasicPlaneBecomePairsAndComeBack) {
     EXPECT_EQ(aaf::TextOfStored(stored), text);
 }
 
+TEST(StoredTexts, FirstAndLastPairComeBackAndTheirNeighboursAreNoPair) {
+    const std::wstring text = L"\U00010000\U0010FFFF";
+    const aaf::Bytes stored = aaf::StoredText(text);
+    EXPECT_EQ(stored, (aaf::Bytes{0, 0xD8, 0, 0xDC, 0xFF, 0xDB, 0xFF, 0xDF, 0, 0}));
+    EXPECT_EQ(aaf::TextOfStored(stored), text);
+    for (const aaf::Bytes& lone : {aaf::Bytes{0, 0xD8, 0xFF, 0xDB}, aaf::Bytes{0, 0xD8, 0, 0xE0},
+                                   aaf::Bytes{0xFF, 0xD7, 0, 0xDC}, aaf::Bytes{0, 0xDC, 0, 0xDC}}) {
+        EXPECT_EQ(aaf::FromUtf16(lone.data(), lone.size()).size(), 2u);
+    }
+}
+
 TEST(StoredTexts, LoneSurrogatesPassBothWays) {
     const std::wstring text(1, static_cast<wchar_t>(0xDC80));
     EXPECT_EQ(aaf::StoredText(text), (aaf::Bytes{0x80, 0xDC, 0, 0}));
