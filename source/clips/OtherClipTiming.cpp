@@ -30,14 +30,18 @@ NCFRESULT OtherClip::SetEditRateAndLengthImpl(const EditorSettings& editorSettin
         editorSettings._movieDurationCalculationToUse == EditorSettings::kUseMovieHeader;
     Rational movieEditRate;
     ncfUInt64 length = 0;
-    // clang-format off
     NCF_RETURN_TEXT(
-        "qtWrapper_->DetermineMovieEditRateAndLength( editorSettings._areSettingsValid && editorSettings._forcedFrameRateEnabled ? editorSettings._forcedFrameRate : 0.0, editorSettings._areSettingsValid ? editorSettings._editorFrameRate : 0.0, editorSettings._areSettingsValid ? editorSettings._singleFrameDuration : 0, &movieEditRate.numerator, &movieEditRate.denominator, &length_, trackLengthInFramesArray.get(), TRACKLENGTH_ARRAY_LEN, editorSettings._movieDurationCalculationToUse == EditorSettings::kUseMovieHeader )",
+        "qtWrapper_->DetermineMovieEditRateAndLength( editorSettings._areSettingsValid && "
+        "editorSettings._forcedFrameRateEnabled ? editorSettings._forcedFrameRate : 0.0, "
+        "editorSettings._areSettingsValid ? editorSettings._editorFrameRate : 0.0, "
+        "editorSettings._areSettingsValid ? editorSettings._singleFrameDuration : 0, "
+        "&movieEditRate.numerator, &movieEditRate.denominator, &length_, "
+        "trackLengthInFramesArray.get(), TRACKLENGTH_ARRAY_LEN, "
+        "editorSettings._movieDurationCalculationToUse == EditorSettings::kUseMovieHeader )",
         qtWrapper_->DetermineMovieEditRateAndLength(
             forcedRate, editorRate, singleFrameDuration, &movieEditRate.numerator,
             &movieEditRate.denominator, &length, trackLengthInFramesArray.data(), trackCount,
             useMovieHeader));
-    // clang-format on
     if (length == 0) {
         console_->Write(1, "The length of the movie can't be determined.\n");
         return NMA_E_NOTINITIALIZED;
