@@ -59,7 +59,7 @@ NCFRESULT OtherClip::CalculateAudioTrackLengthInSamples(ncfUInt32 qtTrack, ncfUI
     AudioTrackMetadata audioInfo;
     NCF_RETURN(GetAudioTrackMetadata(qtTrack, &audioInfo));
     const auto duration = static_cast<double>(qtWrapper_->GetTrackDuration(qtTrack));
-    const double seconds = duration / qtWrapper_->GetMovieTimeScale();
-    *trackLength = TruncateToUInt64(seconds * audioInfo.sampleRate + 0.5);
+    *trackLength = TruncateToUInt64(
+        UnitsIn(duration, qtWrapper_->GetMovieTimeScale(), audioInfo.sampleRate) + 0.5);
     return NCF_OK;
 }
