@@ -11,9 +11,10 @@ rule() { # rule MESSAGE GREP-ARGS...
   fi
 }
 
-rule 'the module knows the border alone' '#include "(reference_host|aaf_library)/' -- source host_interfaces public_include
+rule 'the module knows the border alone' '#include "(reference_host|aaf_library|text)/' -- source host_interfaces public_include
 rule 'host and border know the border alone' '#include "(source|aaf_library)/' -- reference_host host_interfaces public_include
-rule 'the AAF library knows the border alone' '#include "(source|reference_host)/' -- aaf_library
+rule 'the AAF library knows border and encodings alone' '#include "(source|reference_host)/' -- aaf_library
+rule 'encodings know nothing else' '#include "(source|reference_host|aaf_library|host_interfaces)/' -- text
 scripts/check_rooms.sh || failed=1
 rule 'system headers belong in source/plugin/os/' \
   '#include <(windows|unistd|fcntl|dlfcn|pthread|sys/[a-z]+)\.h>' -- source public_include ':!source/plugin/os'

@@ -18,20 +18,19 @@ const EncodingInfo kEncodings[] = {
 }  // namespace
 
 HRESULT FileEncoding::GetName(aafCharacter* name, aafUInt32 bufSize) {
-    return name == nullptr ? AAFRESULT_NULL_PARAM : CopyText(info_.name, name, bufSize);
+    return CopyText(info_.name, name, bufSize);
 }
 
 HRESULT FileEncoding::GetNameBufLen(aafUInt32* bufSize) {
-    return bufSize == nullptr ? AAFRESULT_NULL_PARAM : TextSize(info_.name, bufSize);
+    return TextSize(info_.name, bufSize);
 }
 
 HRESULT FileEncoding::GetDescription(aafCharacter* description, aafUInt32 bufSize) {
-    return description == nullptr ? AAFRESULT_NULL_PARAM
-                                  : CopyText(info_.description, description, bufSize);
+    return CopyText(info_.description, description, bufSize);
 }
 
 HRESULT FileEncoding::GetDescriptionBufLen(aafUInt32* bufSize) {
-    return bufSize == nullptr ? AAFRESULT_NULL_PARAM : TextSize(info_.description, bufSize);
+    return TextSize(info_.description, bufSize);
 }
 
 HRESULT FileEncoding::GetFileKind(aafUID_t* fileKind) {

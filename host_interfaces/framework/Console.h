@@ -20,8 +20,8 @@
 // object is made, and writes at any time. Thread-safe. What goes in is formatted
 // during the call, so nothing has to outlive it.
 struct INCFConsole : INCFUnknown {
-    virtual NCFRESULT ReservedConsoleOperationA() = 0;  // 3
-    virtual NCFRESULT ReservedConsoleOperationB() = 0;  // 4
+    virtual NCFRESULT ReservedConsoleOperationA() { return NCF_E_NOTIMPL; }  // 3
+    virtual NCFRESULT ReservedConsoleOperationB() { return NCF_E_NOTIMPL; }  // 4
     // 5. Writes a formatted line; texts are UTF-8, zero-terminated. Text that comes
     // from a file is an argument, never the format.
     virtual NCFRESULT Write(ncfUInt32 level, const char* format, ...) NCF_PRINTF(3, 4) = 0;

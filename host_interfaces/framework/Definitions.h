@@ -18,8 +18,8 @@ struct INCFPluginDefinition : INCFUnknown {
     // zero. Attributes keep the order in which they were set.
     virtual NCFRESULT SetAttribute(const GUID& attribute, const GUID& valueType, const void* value,
                                    ncfUInt32 bytes) = 0;
-    virtual NCFRESULT ReservedPluginDefinitionA() = 0;  // 4
-    virtual NCFRESULT ReservedPluginDefinitionB() = 0;  // 5
+    virtual NCFRESULT ReservedPluginDefinitionA() { return NCF_E_NOTIMPL; }  // 4
+    virtual NCFRESULT ReservedPluginDefinitionB() { return NCF_E_NOTIMPL; }  // 5
     // 6. Names the module: its id and version, how many components it has (their
     // indexes go from 0), and its name and vendor in UTF-8, which are copied. What
     // the second id and the last number (1) mean is the host's affair.
@@ -45,8 +45,8 @@ struct INCFComponentDefinition : INCFUnknown {
     // 3. As INCFPluginDefinition::SetAttribute.
     virtual NCFRESULT SetAttribute(const GUID& attribute, const GUID& valueType, const void* value,
                                    ncfUInt32 bytes) = 0;
-    virtual NCFRESULT ReservedComponentDefinitionA() = 0;  // 4
-    virtual NCFRESULT ReservedComponentDefinitionB() = 0;  // 5
+    virtual NCFRESULT ReservedComponentDefinitionA() { return NCF_E_NOTIMPL; }  // 4
+    virtual NCFRESULT ReservedComponentDefinitionB() { return NCF_E_NOTIMPL; }  // 5
     // 6. `componentId` is what callers create by, `classId` what reaches
     // NCFGetClassFactory; the type is the same for all components of a module. The
     // display name is UTF-8, copied.

@@ -20,7 +20,7 @@ struct INCFNMAEditorSettings : INCFUnknown {
     virtual NCFRESULT GetSingleFrameDuration(ncfUInt32* duration) = 0;
     // 5. Whether (not 0) clips take `rate`, frames per second, instead of their own.
     virtual NCFRESULT GetForcedFrameRate(ncfUInt32* enabled, double* rate) = 0;
-    virtual NCFRESULT ReservedEditorSetting() = 0;  // 6
+    virtual NCFRESULT ReservedEditorSetting() { return NCF_E_NOTIMPL; }  // 6
     // 7. A setting by its key, which is zero-terminated. "MovieDurationCalc" is the
     // one in use: 1 takes lengths from the movie header. The caller zeroes the
     // outputs; `out2` and `out3`, 64 bits each, may be null, and nothing reads

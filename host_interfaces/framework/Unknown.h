@@ -18,8 +18,8 @@
 //   Time         Objects of a module are made and used between its NCFStartup and
 //                its NCFShutdown (PluginEntry.h); objects of the host outlive that.
 //   Places       A number at an operation is its place in the table, from 0. A
-//                Reserved operation keeps a place: nobody calls it, and the host's
-//                answer is NCF_E_NOTIMPL.
+//                Reserved operation keeps a place: nobody calls it, and the
+//                interface itself answers NCF_E_NOTIMPL.
 //   Arguments    `reserved` arguments are passed as 0 or null and ignored.
 //   Exceptions   None leaves an operation, except the two that say so: in IMediaContainer
 //                and in UTIL::INCFSaxDocumentHandler.

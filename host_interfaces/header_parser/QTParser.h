@@ -17,14 +17,14 @@
 struct IQTParser : INCFUnknown {
     // 3. Seconds from 1904-01-01 UTC.
     virtual NCFRESULT GetCreationTime(ncfUInt64* seconds) = 0;
-    virtual NCFRESULT ReservedParser4() = 0;  // 4
+    virtual NCFRESULT ReservedParser4() { return NCF_E_NOTIMPL; }  // 4
     // 5. Movie time units per second, above 0.
     virtual NCFRESULT GetTimeScale(ncfUInt32* timescale) = 0;
     // 6. In movie time units.
     virtual NCFRESULT GetMovieDuration(ncfUInt32* duration) = 0;
-    virtual NCFRESULT ReservedParser7() = 0;                        // 7
-    virtual NCFRESULT ReservedParser8() = 0;                        // 8
-    virtual NCFRESULT ReservedParser9() = 0;                        // 9
+    virtual NCFRESULT ReservedParser7() { return NCF_E_NOTIMPL; }   // 7
+    virtual NCFRESULT ReservedParser8() { return NCF_E_NOTIMPL; }   // 8
+    virtual NCFRESULT ReservedParser9() { return NCF_E_NOTIMPL; }   // 9
     virtual NCFRESULT GetVideoTrackCount(ncfUInt32* count) = 0;     // 10
     virtual NCFRESULT GetAudioTrackCount(ncfUInt32* count) = 0;     // 11
     virtual NCFRESULT GetTimeCodeTrackCount(ncfUInt32* count) = 0;  // 12

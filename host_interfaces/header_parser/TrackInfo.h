@@ -12,11 +12,11 @@
 // different tracks may be asked at once. Nothing changes once it is given out. What
 // comes out belongs to the caller and outlives the track.
 struct ITrackInfo : INCFUnknown {
-    virtual NCFRESULT ReservedTrack3() = 0;  // 3
-    virtual NCFRESULT ReservedTrack4() = 0;  // 4
-    virtual NCFRESULT ReservedTrack5() = 0;  // 5
-    virtual NCFRESULT ReservedTrack6() = 0;  // 6
-    virtual NCFRESULT ReservedTrack7() = 0;  // 7
+    virtual NCFRESULT ReservedTrack3() { return NCF_E_NOTIMPL; }  // 3
+    virtual NCFRESULT ReservedTrack4() { return NCF_E_NOTIMPL; }  // 4
+    virtual NCFRESULT ReservedTrack5() { return NCF_E_NOTIMPL; }  // 5
+    virtual NCFRESULT ReservedTrack6() { return NCF_E_NOTIMPL; }  // 6
+    virtual NCFRESULT ReservedTrack7() { return NCF_E_NOTIMPL; }  // 7
     // 8. The movie's own track id, never 0.
     virtual NCFRESULT GetTrackId(ncfUInt32* trackId) = 0;
     // 9. In movie time units; in those of IsTrackLinear when it says linear.
@@ -30,8 +30,8 @@ struct ITrackInfo : INCFUnknown {
     // 11. Media time, in media units, at a track time in movie units; -1 in an
     // empty edit. NMA_E_NODATA behind the end of the track.
     virtual NCFRESULT TrackTimeToMediaTime(ncfUInt64 trackTime, ncfSInt64* mediaTime) = 0;
-    virtual NCFRESULT ReservedTrack12() = 0;  // 12
-    virtual NCFRESULT ReservedTrack13() = 0;  // 13
+    virtual NCFRESULT ReservedTrack12() { return NCF_E_NOTIMPL; }  // 12
+    virtual NCFRESULT ReservedTrack13() { return NCF_E_NOTIMPL; }  // 13
     // 14. Media time units per second, above 0.
     virtual NCFRESULT GetMediaTS(ncfUInt32* timescale) = 0;
     // 15. In media time units.
@@ -39,10 +39,10 @@ struct ITrackInfo : INCFUnknown {
     virtual NCFRESULT GetSampleTable(IQTSampleTable** table) = 0;  // 16
     // 17. How many sample descriptions the track has; 0 is possible.
     virtual NCFRESULT GetSampleDescriptionCount(ncfUInt32* count) = 0;
-    virtual NCFRESULT ReservedTrack18() = 0;  // 18
-    virtual NCFRESULT ReservedTrack19() = 0;  // 19
-    virtual NCFRESULT ReservedTrack20() = 0;  // 20
-    virtual NCFRESULT ReservedTrack21() = 0;  // 21
+    virtual NCFRESULT ReservedTrack18() { return NCF_E_NOTIMPL; }  // 18
+    virtual NCFRESULT ReservedTrack19() { return NCF_E_NOTIMPL; }  // 19
+    virtual NCFRESULT ReservedTrack20() { return NCF_E_NOTIMPL; }  // 20
+    virtual NCFRESULT ReservedTrack21() { return NCF_E_NOTIMPL; }  // 21
 
 protected:
     ~ITrackInfo() = default;
@@ -58,7 +58,7 @@ struct IVideoTrackInfo : ITrackInfo {
     // 22. Display matrix of the track, nine numbers row by row (a b u, c d v,
     // x y w; ISO/IEC 14496-12, 6.2.2).
     virtual NCFRESULT GetTrackMatrix(float* matrix) = 0;
-    virtual NCFRESULT ReservedVideoTrack23() = 0;  // 23
+    virtual NCFRESULT ReservedVideoTrack23() { return NCF_E_NOTIMPL; }  // 23
     // 24. `index` from zero; NCF_E_NOTFOUND beyond the count.
     virtual NCFRESULT GetVideoSampleDescription(ncfUInt32 index,
                                                 IVideoSampleDescription** description) = 0;

@@ -36,7 +36,7 @@ struct IQTVideoReader : INCFUnknown {
     // 6. Starts decoding; `mode` is kUseDecompressionSession. Again while started:
     // NCF_OK.
     virtual NCFRESULT InitQT(ncfUInt32 mode) = 0;
-    virtual NCFRESULT ReservedVideoReaderOperation() = 0;  // 7
+    virtual NCFRESULT ReservedVideoReaderOperation() { return NCF_E_NOTIMPL; }  // 7
     // 8. Gives decoder and kept pictures back; started again, the next ReadFrame
     // makes them anew, and until then answers NMA_E_NOTINITIALIZED. Again while
     // released: NCF_OK.
@@ -59,7 +59,7 @@ constexpr const GUID& ncfIdOf(const IQTVideoReader*) {
 // it delivers goes into memory of the caller. Each operation may come on any thread.
 // Tracks have the movie's own ids.
 struct IQTAudioReader : INCFUnknown {
-    virtual NCFRESULT ReservedAudioReaderOperation() = 0;  // 3
+    virtual NCFRESULT ReservedAudioReaderOperation() { return NCF_E_NOTIMPL; }  // 3
     // 4. How the sound of one track is to be delivered: integers of 1 to 4 bytes, in
     // little-endian order or not (0). The rate, in frames per second, is the track's
     // own; it changes nothing. `channels` comes back as the number that will be

@@ -16,7 +16,7 @@
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace cliphost {
 namespace {
@@ -31,7 +31,7 @@ constexpr aafUID_t kPinnedGeneration = ncfGuid("00000000-0000-0000-0000-00000000
 
 // A path in the form that the library takes.
 std::wstring WideName(const std::filesystem::path& path) {
-    return host::text::ToWideLossy(host::system::FromSystemPath(path));
+    return encodings::ToWideLossy(host::system::FromSystemPath(path));
 }
 
 // Keeps the last sentence that the library writes for people, while this lives.

@@ -12,7 +12,7 @@
 #include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace cliphost {
 namespace {
@@ -237,7 +237,7 @@ std::string RenamedText(IAAFTypeDef* type, IAAFPropertyValue* value) {
 }  // namespace
 
 std::string Utf8(std::wstring_view wide) {
-    return host::text::ToUtf8Lossy(host::text::FromWide(wide));
+    return encodings::ToUtf8Lossy(encodings::FromWide(wide));
 }
 
 std::string ToText(const aafUID_t& id) {

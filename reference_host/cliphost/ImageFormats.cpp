@@ -9,10 +9,9 @@ namespace {
 
 using namespace format;
 
-// clang-format off
 constexpr ImageLayout kLayouts[] = {
-    {"2vuy", kCbYCrY, kBytes, 0, PictureBytes::CbYCrY8, 2, 8,
-     "8-bit Y'CbCr 4:2:2, bytes Cb Y Cr Y", "uyvy422"},
+    {"2vuy", kCbYCrY, kBytes, 0, PictureBytes::CbYCrY8, 2, 8, "8-bit Y'CbCr 4:2:2, bytes Cb Y Cr Y",
+     "uyvy422"},
     {"v210", kCbYCrY, kV210, 0, PictureBytes::Unusable, 4, 10,
      "labelled 10-bit Y'CbCr 4:2:2, but holds other bytes: no picture can be made of it", nullptr},
     {"bgra", kBGRA, kBytes, kFullRange, PictureBytes::Bgra8, 4, 8,
@@ -25,8 +24,7 @@ constexpr ImageLayout kLayouts[] = {
      "16-bit R'G'B' 4:4:4:4, big-endian words A R G B", nullptr},
     {"b64a-full", kARGB, kWordsFullRange, 0, PictureBytes::Argb16, 8, 16,
      "16-bit R'G'B' 4:4:4:4, big-endian words A R G B", nullptr},
-    {"a8", kMono, kBytes, 0, PictureBytes::Alpha8, 1, 8,
-     "8-bit alpha, a byte a pixel", "gray"},
+    {"a8", kMono, kBytes, 0, PictureBytes::Alpha8, 1, 8, "8-bit alpha, a byte a pixel", "gray"},
     {"a10", kMono, kTenBits, 0, PictureBytes::Alpha10, 2, 10,
      "10-bit alpha, a plane of the upper 8 bits, then one of the lower 2", nullptr},
 };
@@ -42,7 +40,6 @@ constexpr Word kFields[] = {{kProgressive, "progressive"},
                             {kBottomFirst, "interlaced, bottom field first"}};
 constexpr Word kFrameLayouts[] = {{kMerged, "both fields in one frame"},
                                   {kSplit, "each field by itself"}};
-// clang-format on
 
 template <std::size_t count>
 void Append(std::string& text, const Word (&words)[count], ncfUInt32 value) {

@@ -2,15 +2,15 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/MachinePath.h"
 
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/FileUrl.h"
+#include "text/Encodings.h"
 
 namespace cliphost {
 
 std::string MachinePath(const std::filesystem::path& path) {
     const std::string& bytes = path.native();
     // A byte that is no UTF-8 travels as a surrogate, and nothing else does.
-    if (!host::text::HoldsSurrogate(host::text::FromUtf8(bytes)) && !host::text::IsFileUrl(bytes)) {
+    if (!encodings::HoldsSurrogate(encodings::FromUtf8(bytes)) && !host::text::IsFileUrl(bytes)) {
         return bytes;
     }
     std::error_code error;

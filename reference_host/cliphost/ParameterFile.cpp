@@ -10,7 +10,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/parameters/ParameterDocument.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace cliphost {
 namespace {
@@ -49,9 +49,9 @@ std::string FromWideBytes(const std::filesystem::path& file, const std::string& 
     }
     std::string text;
     // Surrogates that carry bytes of file names would come out as those bytes.
-    const std::u32string characters = host::text::FromUtf16(units);
-    const bool isWhole = bytes.size() % 2 == 0 && !host::text::HoldsSurrogate(characters);
-    if (!isWhole || !host::text::ToUtf8(characters, text)) {
+    const std::u32string characters = encodings::FromUtf16(units);
+    const bool isWhole = bytes.size() % 2 == 0 && !encodings::HoldsSurrogate(characters);
+    if (!isWhole || !encodings::ToUtf8(characters, text)) {
         Refuse(file, "begins as UTF-16 and goes on as something else");
     }
     return text;

@@ -17,8 +17,6 @@ class Console final : public Component<INCFConsole> {
 public:
     using Sink = std::function<void(ncfUInt32 level, const std::string& text)>;
 
-    NCFRESULT ReservedConsoleOperationA() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedConsoleOperationB() override { return NCF_E_NOTIMPL; }
     NCFRESULT Write(ncfUInt32 level, const char* format, ...) override;
 
     // Receives every text as it was written, one at a time; empty brings

@@ -49,8 +49,6 @@ class PluginDefinition final : public Component<INCFPluginDefinition> {
 public:
     NCFRESULT SetAttribute(const GUID& attribute, const GUID& valueType, const void* value,
                            ncfUInt32 bytes) override;
-    NCFRESULT ReservedPluginDefinitionA() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedPluginDefinitionB() override { return NCF_E_NOTIMPL; }
     NCFRESULT Define(const GUID& pluginId, ncfUInt32 major, ncfUInt32 minor, const char* name,
                      const GUID& secondId, const char* vendor, ncfUInt32 componentCount,
                      ncfUInt32 last) override;
@@ -65,8 +63,6 @@ class ComponentDefinition final : public Component<INCFComponentDefinition> {
 public:
     NCFRESULT SetAttribute(const GUID& attribute, const GUID& valueType, const void* value,
                            ncfUInt32 bytes) override;
-    NCFRESULT ReservedComponentDefinitionA() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedComponentDefinitionB() override { return NCF_E_NOTIMPL; }
     NCFRESULT Define(const GUID& componentId, const GUID& componentType, ncfUInt32 major,
                      ncfUInt32 minor, const GUID& classId, const char* displayName) override;
 

@@ -4,9 +4,9 @@
 
 #include "reference_host/framework/Guard.h"
 #include "reference_host/system/Paths.h"
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/util/text/Printable.h"
+#include "text/Encodings.h"
 
 namespace host {
 
@@ -23,7 +23,7 @@ Ref<String> ModulePath(const std::filesystem::path& path) {
 }
 
 std::string DisplayPath(const std::filesystem::path& path) {
-    return text::Printable(text::ToUtf8Lossy(host::system::FromSystemPath(path)));
+    return text::Printable(encodings::ToUtf8Lossy(host::system::FromSystemPath(path)));
 }
 
 }  // namespace host

@@ -26,7 +26,6 @@ public:
     NCFRESULT GetEditorFrameRate(double* rate, ncfUInt32* reservedA, ncfUInt32* reservedB) override;
     NCFRESULT GetSingleFrameDuration(ncfUInt32* duration) override;
     NCFRESULT GetForcedFrameRate(ncfUInt32* enabled, double* rate) override;
-    NCFRESULT ReservedEditorSetting() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetNamedSetting(const ncfUTF8* key, ncfUInt32* value, ncfUInt64* out2,
                               void* out3) override;
 

@@ -5,8 +5,8 @@
 #include <type_traits>
 
 #include "reference_host/framework/Guard.h"
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
+#include "text/Encodings.h"
 
 namespace host {
 
@@ -45,11 +45,11 @@ std::u32string String::Text() const {
         [](const auto& text) -> std::u32string {
             using Held = std::decay_t<decltype(text)>;
             if constexpr (std::is_same_v<Held, std::string>) {
-                return text::FromUtf8(text);
+                return encodings::FromUtf8(text);
             } else if constexpr (std::is_same_v<Held, std::u16string>) {
-                return text::FromUtf16(text);
+                return encodings::FromUtf16(text);
             } else if constexpr (std::is_same_v<Held, std::wstring>) {
-                return text::FromWide(text);
+                return encodings::FromWide(text);
             } else {
                 return text;
             }
@@ -62,19 +62,19 @@ NCFRESULT String::SetText(std::u32string_view text, ncfUInt32 encoding) {
     bool placed = false;
     switch (encoding) {
         case kNCFASCII:
-            placed = text::ToAscii(text, made.emplace<std::string>());
+            placed = encodings::ToAscii(text, made.emplace<std::string>());
             break;
         case kNCFUTF8:
-            placed = text::ToUtf8(text, made.emplace<std::string>());
+            placed = encodings::ToUtf8(text, made.emplace<std::string>());
             break;
         case kNCFUTF16:
-            placed = text::ToUtf16(text, made.emplace<std::u16string>());
+            placed = encodings::ToUtf16(text, made.emplace<std::u16string>());
             break;
         case kNCFUTF32:
-            placed = text::ToUtf32(text, made.emplace<std::u32string>());
+            placed = encodings::ToUtf32(text, made.emplace<std::u32string>());
             break;
         case kNCFWCHAR:
-            placed = text::ToWide(text, made.emplace<std::wstring>());
+            placed = encodings::ToWide(text, made.emplace<std::wstring>());
             break;
         default:
             return NCF_E_INVALIDARG;
@@ -103,15 +103,15 @@ NCFRESULT String::AssignUnits(ncfUInt32 keepAs, const Unit* text, ncfUInt32 unit
 }
 
 NCFRESULT String::AssignUTF8(ncfUInt32 keepAs, const ncfUTF8* text, ncfUInt32 units) {
-    return AssignUnits(keepAs, text, units, text::FromUtf8);
+    return AssignUnits(keepAs, text, units, encodings::FromUtf8);
 }
 
 NCFRESULT String::AssignUTF16(ncfUInt32 keepAs, const ncfUTF16* text, ncfUInt32 units) {
-    return AssignUnits(keepAs, text, units, text::FromUtf16);
+    return AssignUnits(keepAs, text, units, encodings::FromUtf16);
 }
 
 NCFRESULT String::AssignWCHAR(ncfUInt32 keepAs, const ncfWCHAR* text, ncfUInt32 units) {
-    return AssignUnits(keepAs, text, units, text::FromWide);
+    return AssignUnits(keepAs, text, units, encodings::FromWide);
 }
 
 NCFRESULT String::ConvertTo(ncfUInt32 encoding) {
@@ -157,7 +157,7 @@ Ref<String> MakeString(std::u32string_view text, ncfUInt32 encoding) {
 }
 
 Ref<String> MakeString(std::string_view utf8, ncfUInt32 encoding) {
-    return MakeString(text::FromUtf8(utf8), encoding);
+    return MakeString(encodings::FromUtf8(utf8), encoding);
 }
 
 template <class Text>

@@ -5,7 +5,7 @@
 // stop at failures, and most names lack the word that is looked for.
 #include "reference_host/framework/Guard.h"
 #include "reference_host/framework/String.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace host {
 
@@ -14,16 +14,16 @@ namespace {
 constexpr ncfSInt32 kNotFound = -1;
 
 bool Encode(std::u32string_view text, std::string& out) {
-    return text::ToUtf8(text, out);
+    return encodings::ToUtf8(text, out);
 }
 bool Encode(std::u32string_view text, std::u16string& out) {
-    return text::ToUtf16(text, out);
+    return encodings::ToUtf16(text, out);
 }
 bool Encode(std::u32string_view text, std::u32string& out) {
-    return text::ToUtf32(text, out);
+    return encodings::ToUtf32(text, out);
 }
 bool Encode(std::u32string_view text, std::wstring& out) {
-    return text::ToWide(text, out);
+    return encodings::ToWide(text, out);
 }
 
 ncfSInt32 Place(std::size_t at) {

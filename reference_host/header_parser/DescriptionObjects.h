@@ -30,23 +30,6 @@ public:
     NCFRESULT GetRIAttributes(INCFString** text) override;
     NCFRESULT GetCMAttributes(INCFString** text) override;
 
-    NCFRESULT ReservedVideoDescription4() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription6() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription7() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription8() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription9() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription11() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription13() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription14() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription15() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription16() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription17() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription21() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription22() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription23() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription27() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription28() override { return NCF_E_NOTIMPL; }
-
 private:
     std::shared_ptr<const VideoDescription> description_;
 };
@@ -63,9 +46,6 @@ public:
     NCFRESULT IsLPCM(ncfBool* isLPCM) override;
     NCFRESULT GetBytesPerPacket(ncfUInt32* bytes) override;
     NCFRESULT IsLittleEndian(ncfBool* littleEndian) override;
-
-    NCFRESULT ReservedAudioDescription3() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedAudioDescription4() override { return NCF_E_NOTIMPL; }
 
 private:
     std::shared_ptr<const SoundDescription> description_;

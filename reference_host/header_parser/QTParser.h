@@ -38,11 +38,6 @@ public:
     NCFRESULT IsMovieSelfContained(ncfBool* selfContained) override;
     NCFRESULT GetMOOVAtom(ncfUInt64* position, ncfUInt64* size) override;
 
-    NCFRESULT ReservedParser4() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedParser7() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedParser8() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedParser9() override { return NCF_E_NOTIMPL; }
-
     // Why the file was given up; nothing before that.
     const Refusal& WhyRefused() const { return refusal_; }
     // What a file that ends at `fileSize` lacks for a parser that waits for bytes

@@ -31,18 +31,6 @@ public:
     NCFRESULT GetSampleTable(IQTSampleTable** table) override;
     NCFRESULT GetSampleDescriptionCount(ncfUInt32* count) override;
 
-    NCFRESULT ReservedTrack3() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack4() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack5() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack6() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack7() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack12() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack13() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack18() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack19() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack20() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack21() override { return NCF_E_NOTIMPL; }
-
 protected:
     void* FindInterface(const GUID& iid) override;
 
@@ -64,7 +52,6 @@ class VideoTrackObject final : public TrackObject<IVideoTrackInfo> {
 public:
     using TrackObject::TrackObject;
     NCFRESULT GetTrackMatrix(float* matrix) override;
-    NCFRESULT ReservedVideoTrack23() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetVideoSampleDescription(ncfUInt32 index,
                                         IVideoSampleDescription** description) override;
 };

@@ -6,9 +6,9 @@
 #include <cmath>
 
 #include "reference_host/framework/Guard.h"
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/xml/XmlNames.h"
+#include "text/Encodings.h"
 
 namespace host {
 
@@ -19,7 +19,7 @@ enum DependencyKind : ncfUInt32 { kEnables = 1, kDisables = 2 };
 // A caller's text, copied; false when it may not stand in a document.
 bool Take(const char* text, std::string& out) {
     out = text == nullptr ? "" : text;
-    return out.size() <= ParameterLimits::kLongestText && IsXmlContent(text::FromUtf8(out));
+    return out.size() <= ParameterLimits::kLongestText && IsXmlContent(encodings::FromUtf8(out));
 }
 
 template <class Items>
@@ -52,7 +52,7 @@ NCFRESULT ParameterSuite::WriteXML(INCFString* out) {
         Need(stage_ != Stage::kEmpty && stage_ != Stage::kDescribing, NCF_E_FAIL);
         std::string xml;
         const NCFRESULT written = WriteParameterDocument({{component_}}, xml);
-        return written < 0 ? written : text::Assign(out, text::FromUtf8(xml), kNCFUTF8);
+        return written < 0 ? written : text::Assign(out, encodings::FromUtf8(xml), kNCFUTF8);
     });
 }
 

@@ -5,8 +5,8 @@
 #include "reference_host/framework/Guard.h"
 #include "reference_host/framework/String.h"
 #include "reference_host/parameters/ParameterValue.h"
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
+#include "text/Encodings.h"
 
 namespace host {
 
@@ -61,7 +61,7 @@ NCFRESULT ParametersReader::Parse(INCFString* xml) {
         if (xml->GetLength() > ParameterLimits::kLargestDocument) {
             result = NCF_E_NOTSUPPORTED;
             problem = "it is too large";
-        } else if (text::ToUtf8(text::Read(xml), bytes)) {
+        } else if (encodings::ToUtf8(text::Read(xml), bytes)) {
             result = ReadParameterDocument(bytes, document, problem);
         }
         if (result < 0) {

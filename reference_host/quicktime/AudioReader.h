@@ -22,7 +22,6 @@ public:
                 bool hasWholeIndex)
         : path_(std::move(path)), streams_(std::move(streams)), hasWholeIndex_(hasWholeIndex) {}
 
-    NCFRESULT ReservedAudioReaderOperation() override { return NCF_E_NOTIMPL; }
     NCFRESULT SetParams(ncfUInt32 track, ncfUInt32 bytesPerSample, ncfUInt8 littleEndian,
                         double sampleRate, ncfUInt32& channels) override;
     NCFRESULT ReadSamples(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* count, void* destination,

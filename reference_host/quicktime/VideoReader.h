@@ -33,7 +33,6 @@ public:
                         ncfUInt32) override;
     ncfUInt32 GetFrameBufferSize(ncfUInt32 all, ncfUInt64 sample, ncfUInt32) override;
     NCFRESULT InitQT(ncfUInt32 mode) override;
-    NCFRESULT ReservedVideoReaderOperation() override { return NCF_E_NOTIMPL; }
     NCFRESULT ReleaseQT() override;
 
 private:

@@ -11,7 +11,7 @@
 #include <array>
 #include <fstream>
 
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace host::system {
 
@@ -93,7 +93,7 @@ VolumeFacts ReadVolumeFacts(const std::filesystem::path& folder) {
     if (statvfs(real.c_str(), &system) == 0) {
         volume.serialNumber = static_cast<std::uint32_t>(system.f_fsid & 0xFFFFFFFFu);
     }
-    volume.label = text::FromUtf8(MountPoint(real, facts.st_dev).filename().native());
+    volume.label = encodings::FromUtf8(MountPoint(real, facts.st_dev).filename().native());
     volume.type = VolumeType(real, facts.st_dev);
     return volume;
 }

@@ -7,7 +7,7 @@
 #include <cwctype>
 #include <iterator>
 
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace host::system {
 
@@ -45,7 +45,7 @@ VolumeFacts ReadVolumeFacts(const std::filesystem::path& folder) {
     if (GetVolumeInformationW(root, label, static_cast<DWORD>(std::size(label)), &serial, nullptr,
                               nullptr, nullptr, 0)) {
         volume.serialNumber = serial;
-        volume.label = text::FromWide(label);
+        volume.label = encodings::FromWide(label);
     }
     volume.type = VolumeType(root);
     return volume;

@@ -1,13 +1,13 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/Paths.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace host::system {
 
 bool ToSystemPath(std::u32string_view path, std::filesystem::path& out) {
     std::string bytes;
-    if (!text::ToUtf8(path, bytes) || bytes.find('\0') != std::string::npos) {
+    if (!encodings::ToUtf8(path, bytes) || bytes.find('\0') != std::string::npos) {
         return false;
     }
     for (char& byte : bytes) {
@@ -18,7 +18,7 @@ bool ToSystemPath(std::u32string_view path, std::filesystem::path& out) {
 }
 
 std::u32string FromSystemPath(const std::filesystem::path& path) {
-    return text::FromUtf8(path.native());
+    return encodings::FromUtf8(path.native());
 }
 
 bool HoldsBackslash(const std::filesystem::path& path) {

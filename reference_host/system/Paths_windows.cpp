@@ -1,13 +1,13 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/Paths.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace host::system {
 
 bool ToSystemPath(std::u32string_view path, std::filesystem::path& out) {
     std::wstring units;
-    if (!text::ToWide(path, units) || units.find(L'\0') != std::wstring::npos) {
+    if (!encodings::ToWide(path, units) || units.find(L'\0') != std::wstring::npos) {
         return false;
     }
     for (wchar_t& unit : units) {
@@ -18,7 +18,7 @@ bool ToSystemPath(std::u32string_view path, std::filesystem::path& out) {
 }
 
 std::u32string FromSystemPath(const std::filesystem::path& path) {
-    return text::FromWide(path.native());
+    return encodings::FromWide(path.native());
 }
 
 bool HoldsBackslash(const std::filesystem::path&) {

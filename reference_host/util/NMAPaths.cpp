@@ -7,9 +7,9 @@
 #include "reference_host/system/Paths.h"
 #include "reference_host/util/Factory.h"
 #include "reference_host/util/NMAStringState.h"
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/HostText.h"
+#include "text/Encodings.h"
 
 namespace text = host::text;
 using host::util::Quietly;
@@ -71,10 +71,10 @@ NCFRESULT UrlOf(std::u32string path, std::u32string& url) {
         path.erase(0, 2);
     }
     std::string bytes;
-    if (!text::ToUtf8(path, bytes)) {
+    if (!encodings::ToUtf8(path, bytes)) {
         return NCF_E_FAIL;
     }
-    url += text::FromUtf8(text::PercentEncoded(bytes));
+    url += encodings::FromUtf8(text::PercentEncoded(bytes));
     return NCF_OK;
 }
 

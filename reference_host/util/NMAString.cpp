@@ -7,7 +7,7 @@
 #include "reference_host/util/Factory.h"
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/RefusingString.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace text = host::text;
 using host::util::Quietly;
@@ -23,7 +23,7 @@ NMAString::NMAString(const char* utf8) : NMAString() {
         return;
     }
     state_->encoding = kNCFUTF8;
-    Quietly([&] { state_->text = text::FromUtf8(utf8 == nullptr ? "" : utf8); });
+    Quietly([&] { state_->text = encodings::FromUtf8(utf8 == nullptr ? "" : utf8); });
 }
 
 NMAString::NMAString(INCFString* source, ncfUInt32 encoding) : NMAString() {
@@ -145,13 +145,13 @@ INCFString** NMAString::OutArg() {
 }
 
 const char* NMAString::GetUTF8String() const {
-    return state_ == nullptr ? "" : state_->Shown(&State::utf8, text::ToUtf8Lossy, "");
+    return state_ == nullptr ? "" : state_->Shown(&State::utf8, encodings::ToUtf8Lossy, "");
 }
 
 const ncfUTF16* NMAString::GetUTF16String() const {
-    return state_ == nullptr ? u"" : state_->Shown(&State::utf16, text::ToUtf16Lossy, u"");
+    return state_ == nullptr ? u"" : state_->Shown(&State::utf16, encodings::ToUtf16Lossy, u"");
 }
 
 const wchar_t* NMAString::GetWCHARString() const {
-    return state_ == nullptr ? L"" : state_->Shown(&State::wide, text::ToWideLossy, L"");
+    return state_ == nullptr ? L"" : state_->Shown(&State::wide, encodings::ToWideLossy, L"");
 }

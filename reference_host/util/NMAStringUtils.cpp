@@ -7,9 +7,8 @@
 
 #include "reference_host/system/Paths.h"
 #include "reference_host/util/NMAStringState.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
-namespace text = host::text;
 using host::util::Quietly;
 
 NMAString NMAStringUtils::CreateWCharNMAString(const wchar_t* characters, ncfSInt32 length) {
@@ -21,7 +20,7 @@ NMAString NMAStringUtils::CreateWCharNMAString(const wchar_t* characters, ncfSIn
     Quietly([&] {
         const std::size_t units =
             length == -1 ? std::wcslen(characters) : static_cast<std::size_t>(length);
-        made.state_->text = text::FromWide({characters, units});
+        made.state_->text = encodings::FromWide({characters, units});
     });
     return made;
 }

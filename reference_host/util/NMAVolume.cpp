@@ -13,7 +13,7 @@
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/RefusingString.h"
 #include "reference_host/util/files/FolderSearch.h"
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace text = host::text;
 using host::files::FolderSearch;
@@ -62,7 +62,7 @@ INCFString* NMAVolume::GetFirstFile(const char* pattern, void*& handle) {
         return nullptr;
     }
     return Quietly(static_cast<INCFString*>(nullptr), [&] {
-        auto search = std::make_unique<FolderSearch>(state_->folder, text::FromUtf8(pattern));
+        auto search = std::make_unique<FolderSearch>(state_->folder, encodings::FromUtf8(pattern));
         void* started = search.get();
         state_->searches.push_back(std::move(search));
         handle = started;

@@ -4,11 +4,11 @@
 
 #include "reference_host/framework/Guard.h"
 #include "reference_host/framework/HostPath.h"
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/xml/InputFile.h"
 #include "reference_host/xml/XmlLimits.h"
 #include "reference_host/xml/XmlTree.h"
+#include "text/Encodings.h"
 
 namespace host {
 
@@ -37,7 +37,7 @@ NCFRESULT XmlDocument::LoadFromText(INCFString* text) {
     return Guarded([&]() -> NCFRESULT {
         Need(text);
         std::string bytes;
-        Need(text::ToUtf8(text::Read(text), bytes), NCF_E_FAIL);
+        Need(encodings::ToUtf8(text::Read(text), bytes), NCF_E_FAIL);
         Need(bytes.size() <= XmlLimits::kLargestDocument, NCF_E_NOTSUPPORTED);
         NCFRESULT result = NCF_OK;
         tree_ = XmlTree::Load(bytes, "UTF-8", result);

@@ -8,10 +8,10 @@
 
 #include "reference_host/framework/Guard.h"
 #include "reference_host/framework/HostPath.h"
-#include "reference_host/util/text/Encodings.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/xml/XmlLimits.h"
 #include "reference_host/xml/XmlNames.h"
+#include "text/Encodings.h"
 
 namespace host {
 
@@ -22,12 +22,12 @@ constexpr char kDeclaration[] = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n";
 // A name or a content as UTF-8; false when it may not stand in a document.
 bool ReadName(INCFString* string, std::string& out) {
     const std::u32string text = text::Read(string);
-    return IsXmlName(text) && text::ToUtf8(text, out);
+    return IsXmlName(text) && encodings::ToUtf8(text, out);
 }
 
 bool ReadContent(INCFString* string, std::string& out) {
     const std::u32string text = text::Read(string);
-    return IsXmlContent(text) && text::ToUtf8(text, out);
+    return IsXmlContent(text) && encodings::ToUtf8(text, out);
 }
 
 // A carriage return that stands bare in a text is a line feed to every reader;

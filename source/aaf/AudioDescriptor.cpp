@@ -56,11 +56,9 @@ struct SoundDescriptor {
     }
 };
 
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-// clang-format off
-
 NCFRESULT SoundDescriptor::Create() {
-    ThrowIfFailed(pDictionary->CreateInstance(AUID_AAFPCMDescriptor, IID_IAAFPCMDescriptor, (IUnknown**)&pPCMDescriptor));
+    ThrowIfFailed(pDictionary->CreateInstance(AUID_AAFPCMDescriptor, IID_IAAFPCMDescriptor,
+                                              (IUnknown**)&pPCMDescriptor));
     NCF_RETURN(pPCMDescriptor->QueryInterface(IID_IUnknown, (void**)&pGenericDescriptor));
     NCF_RETURN(pPCMDescriptor->Initialize());
     NCF_RETURN(pGenericDescriptor->QueryInterface(IID_IAAFFileDescriptor, (void**)&pFileDesc));
@@ -70,8 +68,10 @@ NCFRESULT SoundDescriptor::Create() {
 
 NCFRESULT SoundDescriptor::ReadTrack() {
     NCF_RETURN(media->GetAudioTrackQTId(trackNum, qtTrack));
-    const NCFRESULT r = MovieRequiresSampleProviderForAudio(pConsole, media, qtTrack, &numAudioSamples);
-    NCF_RETURN_TEXT("MovieRequiresSampleProviderForAudio(pConsole, media, qtTrack, &numAudioSamples)", r);
+    const NCFRESULT r =
+        MovieRequiresSampleProviderForAudio(pConsole, media, qtTrack, &numAudioSamples);
+    NCF_RETURN_TEXT(
+        "MovieRequiresSampleProviderForAudio(pConsole, media, qtTrack, &numAudioSamples)", r);
     if (r == 0) {
         return ReadThroughWrapper();
     }
@@ -83,7 +83,8 @@ NCFRESULT SoundDescriptor::ReadThroughWrapper() {
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper;
     NCF_RETURN(media->GetQuickTimeInterface(qtWrapper));
     double sampleRate = 0.0;
-    NCF_RETURN(qtWrapper->GetAudioInfoForTrack(qtTrack, &numAudioChannels, &sampleRate, &formatID, NULL, &bytesPerPacket, NULL, NULL, NULL, NULL));
+    NCF_RETURN(qtWrapper->GetAudioInfoForTrack(qtTrack, &numAudioChannels, &sampleRate, &formatID,
+                                               NULL, &bytesPerPacket, NULL, NULL, NULL, NULL));
     SetRate(sampleRate);
     bitsPerFrame = BitsInASecond(sampleRate);
     NCF_RETURN(pSoundDescriptor->SetCompression(MakeAAFUIDfromMXFUL(CompressedSoundCodingBaseKey)));
@@ -104,14 +105,17 @@ NCFRESULT SoundDescriptor::ReadFromHeaders() {
     if (audioInfo.isBigEndian) {
         NCF_RETURN(pSoundDescriptor->SetCompression(MakeAAFUIDfromMXFUL(UncompressedPCM_BigEndian_AudioCoding)));
     } else {
-        NCF_RETURN(pSoundDescriptor->SetCompression(MakeAAFUIDfromMXFUL(UncompressedPCMAudioCoding)));
+        NCF_RETURN(
+            pSoundDescriptor->SetCompression(MakeAAFUIDfromMXFUL(UncompressedPCMAudioCoding)));
     }
     return NCF_OK;
 }
 
 NCFRESULT SoundDescriptor::SetValues() {
-    slog::Progress(ncfFunction) << "qtTrack: " << qtTrack << "; numAudioChannels: " << numAudioChannels;
-    slog::Progress(ncfFunction) << "qtTrack: " << qtTrack << "; quantizationBits: " << quantizationBits;
+    slog::Progress(ncfFunction) << "qtTrack: " << qtTrack
+                                << "; numAudioChannels: " << numAudioChannels;
+    slog::Progress(ncfFunction) << "qtTrack: " << qtTrack
+                                << "; quantizationBits: " << quantizationBits;
     AddAudioFormatBinColumnEntry(pMobMasterMob, pConsole, formatID);
 
     NCF_RETURN(pPCMDescriptor->SetAverageBPS(bitsPerFrame ));
@@ -133,8 +137,6 @@ NCFRESULT SoundDescriptor::Append() {
     NCF_RETURN(pMultiDescriptor->AppendFileDescriptor( pFileDesc ));
     return NCF_OK;
 }
-
-// clang-format on
 
 }  // namespace
 

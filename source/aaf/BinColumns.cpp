@@ -63,9 +63,6 @@ NCFRESULT AddBinColumnEntry(IAAFSmartPointer<IAAFMob> pMobMasterMob,
     return NCF_OK;
 }
 
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-// clang-format off
-
 void AddAspectRatioBinColumnEntry(IAAFSmartPointer<IAAFMob> pMobMasterMob,
                                   NCFSmartPtr<INCFConsole> pConsole, AAFInfo& aafInfo,
                                   ncfUInt32 numerator, ncfUInt32 denominator,
@@ -79,10 +76,12 @@ void AddAspectRatioBinColumnEntry(IAAFSmartPointer<IAAFMob> pMobMasterMob,
     aspectRatioOut = {(aafInt32)aafInfo.aspectNumerator, (aafInt32)aafInfo.aspectDenominator};
 
     char text[32];
-    std::snprintf(text, sizeof(text), "%d:%d", (int)aafInfo.aspectNumerator, (int)aafInfo.aspectDenominator);
+    std::snprintf(text, sizeof(text), "%d:%d", (int)aafInfo.aspectNumerator,
+                  (int)aafInfo.aspectDenominator);
     const NMAString arStr(text);
     const aafCharacter iar[] = L"Image Aspect Ratio";
-    NCF_SKIP(AddBinColumnEntry(pMobMasterMob, pConsole, &iar[0], (aafCharacter *) arStr.GetWCHARString()));
+    NCF_SKIP(AddBinColumnEntry(pMobMasterMob, pConsole, &iar[0],
+                               (aafCharacter *) arStr.GetWCHARString()));
 }
 
 NCFRESULT AddVideoBinColumnEntry(std::tr1::shared_ptr<BaseClip> media,
@@ -119,8 +118,10 @@ NCFRESULT AddVideoBinColumnEntry(std::tr1::shared_ptr<BaseClip> media,
     // with the word leaves nothing.
     const ncfUInt32 start = 6 + (ncfUInt32)findIndex;
     const aafCharacter* const cell = start <= codecName->GetLength() ? p_buffer + start : L"";
-    NCF_SKIP_TEXT("AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0],(aafCharacter *)(&p_buffer[6+findIndex]))",
-                  AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0], cell));
+    NCF_SKIP_TEXT(
+        "AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0],(aafCharacter "
+        "*)(&p_buffer[6+findIndex]))",
+        AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0], cell));
     return NCF_OK;
 }
 
@@ -129,9 +130,8 @@ void AddAudioFormatBinColumnEntry(IAAFSmartPointer<IAAFMob> pMobMasterMob,
     NCF_FUNCTION("NMA::Impl::AddAudioFormatBinColumnEntry");
     const NMAString arStr(AudioFormatName(formatID));
     const aafCharacter aff[] = L"Audio Format";
-    NCF_SKIP(AddBinColumnEntry(pMobMasterMob, pConsole, &aff[0], (aafCharacter *) arStr.GetWCHARString()));
+    NCF_SKIP(AddBinColumnEntry(pMobMasterMob, pConsole, &aff[0],
+                               (aafCharacter *) arStr.GetWCHARString()));
 }
-
-// clang-format on
 
 }  // namespace NMA::Impl

@@ -66,9 +66,6 @@ void PutBox(const IAAFSmartPointer<IAAFClassDef>& pClassDef,
 
 }  // namespace
 
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-// clang-format off
-
 NCFRESULT InitializeNivoBoundsBoxType(IAAFSmartPointer<IAAFDictionary> pDictionary,
                                       IAAFSmartPointer<IAAFTypeDef> pTypeDef) {
     NCF_FUNCTION("NMA::Impl::InitializeNivoBoundsBoxType");
@@ -83,7 +80,8 @@ NCFRESULT InitializeNivoBoundsBoxType(IAAFSmartPointer<IAAFDictionary> pDictiona
         aafCharacter width[] = L"Width";
         aafCharacter height[] = L"Height";
         aafString_t memberNames[aafBoundsBoxNumMembers] = {positionX, positionY, width, height};
-        NCF_RETURN(pTDRec->Initialize(kAAFTypeID_NivoBoundsBox, memberTypes, memberNames, aafBoundsBoxNumMembers, L"BoundsBox"));
+        NCF_RETURN(pTDRec->Initialize(kAAFTypeID_NivoBoundsBox, memberTypes, memberNames,
+                                      aafBoundsBoxNumMembers, L"BoundsBox"));
         return NCF_OK;
     });
 }
@@ -99,20 +97,20 @@ NCFRESULT SetAVCISliceCount(IAAFSmartPointer<IAAFHeader> /*pHeader*/,
     NCF_RETURN(pTDint32->QueryInterface(IID_IAAFTypeDefInt, (void**)&pTDInt));
     ncfUInt32 localSliceCount = sliceCount;
     IAAFSmartPointer<IAAFPropertyValue> pPVsliceCount;
-    NCF_RETURN(pTDInt->CreateValue((aafMemPtr_t)&localSliceCount, sizeof(localSliceCount), &pPVsliceCount));
+    NCF_RETURN(pTDInt->CreateValue((aafMemPtr_t)&localSliceCount, sizeof(localSliceCount),
+                                   &pPVsliceCount));
     IAAFSmartPointer<IAAFClassDef> pClassDef;
     NCF_RETURN(pDictionary->LookupClassDef(AUID_AAFCDCIDescriptor,& pClassDef));
     IAAFSmartPointer<IAAFPropertyDef> pPropDef;
     if (pClassDef->LookupPropertyDef(kAAFPropID_CDCIAVCISliceCount, &pPropDef) < 0) {
-        NCF_RETURN(pClassDef->RegisterOptionalPropertyDef(kAAFPropID_CDCIAVCISliceCount, L"AVCISliceCount", pTDint32, &pPropDef));
+        NCF_RETURN(pClassDef->RegisterOptionalPropertyDef(kAAFPropID_CDCIAVCISliceCount,
+                                                          L"AVCISliceCount", pTDint32, &pPropDef));
     }
     IAAFSmartPointer<IAAFObject> pObject;
     NCF_RETURN(pCDCIDescriptor->QueryInterface(IID_IAAFObject,(void**)&pObject));
     NCF_RETURN(pObject->SetPropertyValue(pPropDef, pPVsliceCount));
     return NCF_OK;
 }
-
-// clang-format on
 
 NCFRESULT PutBoxesToAAF(IAAFSmartPointer<IAAFDictionary> pDictionary,
                         IAAFSmartPointer<IAAFDigitalImageDescriptor> pDigitalImageDescriptor,

@@ -60,7 +60,6 @@ NCFRESULT AddMasterMobAttributes(IAAFSmartPointer<IAAFDictionary> pDictionary,
     });
 }
 
-// clang-format off
 NCFRESULT AddReformattingOption(IAAFSmartPointer<IAAFDictionary> pDictionary,
                                 IAAFSmartPointer<IAAFTypeDefVariableArray> pTDVarArray,
                                 IAAFSmartPointer<IAAFPropertyValue> pPVArray) {
@@ -72,14 +71,15 @@ NCFRESULT AddReformattingOption(IAAFSmartPointer<IAAFDictionary> pDictionary,
     IAAFSmartPointer<IAAFTypeDefObjectRef> pTDObjRef;
     NCF_RETURN(pTypeDefTVSR->QueryInterface (IID_IAAFTypeDefObjectRef, (void **)&pTDObjRef));
     IAAFSmartPointer<IAAFTaggedValue> pTaggedValue;
-    NCF_RETURN(defs.cdTaggedValue()->CreateInstance(IID_IAAFTaggedValue, (IUnknown **)&pTaggedValue));
+    NCF_RETURN(
+        defs.cdTaggedValue()->CreateInstance(IID_IAAFTaggedValue, (IUnknown **)&pTaggedValue));
     aafUInt8 value[sizeof(aafInt32)] = {};
-    NCF_RETURN(pTaggedValue->Initialize(L"_BOUNDS_REFORMATTING_OPTION", defs.tdInt32(), sizeof(aafInt32), value));
+    NCF_RETURN(pTaggedValue->Initialize(L"_BOUNDS_REFORMATTING_OPTION", defs.tdInt32(),
+                                        sizeof(aafInt32), value));
     IAAFSmartPointer<IAAFPropertyValue> pPVObject;
     NCF_RETURN(pTDObjRef->CreateValue(pTaggedValue, &pPVObject));
     NCF_RETURN(pTDVarArray->AppendElement(pPVArray,pPVObject));
     return NCF_OK;
 }
-// clang-format on
 
 }  // namespace NMA::Impl

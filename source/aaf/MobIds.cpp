@@ -17,7 +17,6 @@ aafMobID_t MobIdTemplate(aafUInt8 instanceHigh) {
             {}};
 }
 
-// clang-format off
 NCFRESULT GenerateUID(std::tr1::shared_ptr<BaseClip> /*media*/, const void* pContent,
                       ncfUInt32 contentSize, aafUID_t& uid) {
     NCF_FUNCTION("NMA::Impl::GenerateUID");
@@ -30,10 +29,10 @@ NCFRESULT GenerateUID(std::tr1::shared_ptr<BaseClip> /*media*/, const void* pCon
         GenerateUMIDFromData_Finish(&UMIDGenState, &dropped);  // frees the state
     }
     NCF_RETURN_TEXT(
-        "GenerateUMIDFromData_AddData(&UMIDGenState, contentSize, (unsigned char*)pContent)", added);
+        "GenerateUMIDFromData_AddData(&UMIDGenState, contentSize, (unsigned char*)pContent)",
+        added);
     NCF_RETURN(GenerateUMIDFromData_Finish(&UMIDGenState, &uid));
     return NCF_OK;
 }
-// clang-format on
 
 }  // namespace NMA::Impl

@@ -46,18 +46,18 @@ struct Description : ClipDescription {
     NCFRESULT FinishMasterMob();
 };
 
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-// clang-format off
-
 NCFRESULT Description::OpenFile() {
     aafCharacter companyName[] = L"Cliphost";
     aafCharacter productName[] = L"QuickTime Plug-In";
     aafCharacter productVersionString[] = L"" PRODUCT_VERSION_TEXT;
     aafCharacter platform[] = L"Win64";
     aafProductVersion_t productVersion = {PRODUCT_VERSION_NUMBERS, 6720, kAAFVersionUnknown};
-    aafProductIdentification_t productID = {
-        companyName, productName, productVersionString,
-        ncfGuid("781F84B7-B989-4534-8A07-C595CB9A6FB8"), platform, &productVersion};
+    aafProductIdentification_t productID = {companyName,
+                                            productName,
+                                            productVersionString,
+                                            ncfGuid("781F84B7-B989-4534-8A07-C595CB9A6FB8"),
+                                            platform,
+                                            &productVersion};
 
     NCF_RETURN(AAFFileOpenTransient(&productID, &pTheAAFFile));
     NCF_RETURN(pTheAAFFile->GetHeader(&pHeader));
@@ -119,14 +119,18 @@ NCFRESULT Description::IdentifyMobs() {
 NCFRESULT Description::DescribeFileMob() {
     AAFDefs defs(pDictionary);
     IAAFSmartPointer<IAAFFileDescriptor> pFileDescriptor;
-    NCF_RETURN(defs.cdMultipleDescriptor()->CreateInstance(IID_IAAFMultipleDescriptor, (IUnknown **)&pMultiDescriptor));
+    NCF_RETURN(defs.cdMultipleDescriptor()->CreateInstance(IID_IAAFMultipleDescriptor,
+                                                           (IUnknown **)&pMultiDescriptor));
     NCF_RETURN(pMultiDescriptor->Initialize());
     NCF_RETURN(pMultiDescriptor->QueryInterface(IID_IAAFFileDescriptor, (void**)&pFileDescriptor));
 
-    NCF_RETURN(AddTracksToAAF(media, pConsole, pHeader, pDictionary, pMobMasterMob, pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, pMultiDescriptor, pComponentFactory, &absoluteStartTime));
+    NCF_RETURN(AddTracksToAAF(media, pConsole, pHeader, pDictionary, pMobMasterMob, pMasterMob,
+                              pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, pMultiDescriptor,
+                              pComponentFactory, &absoluteStartTime));
 
     IAAFSmartPointer<IAAFEssenceDescriptor> pEssenceDesc;
-    NCF_RETURN(pMultiDescriptor->QueryInterface (IID_IAAFEssenceDescriptor, (void **)&pEssenceDesc));
+    NCF_RETURN(
+        pMultiDescriptor->QueryInterface (IID_IAAFEssenceDescriptor, (void **)&pEssenceDesc));
     NCF_RETURN(AddLocator(theMoviePathW, pDictionary, pEssenceDesc));
     NCF_RETURN(pFileMob->SetEssenceDescriptor(pEssenceDesc));
     return NCF_OK;
@@ -137,7 +141,8 @@ NCFRESULT Description::DescribeSourceMob() {
     AAFDefs defs(pDictionary);
     IAAFSmartPointer<IAAFImportDescriptor> pImportDesc;
     IAAFSmartPointer<IAAFEssenceDescriptor> pEssenceDesc;
-    NCF_RETURN(defs.cdImportDescriptor()->CreateInstance(IID_IAAFImportDescriptor, (IUnknown **)&pImportDesc));
+    NCF_RETURN(defs.cdImportDescriptor()->CreateInstance(IID_IAAFImportDescriptor,
+                                                         (IUnknown **)&pImportDesc));
     NCF_RETURN(pImportDesc->QueryInterface(IID_IAAFEssenceDescriptor, (void **)&pEssenceDesc));
     NCF_RETURN(AddLocator(theMoviePathW, pDictionary, pEssenceDesc));
     NCF_RETURN(pSourceMob->SetEssenceDescriptor(pEssenceDesc));
@@ -162,8 +167,6 @@ NCFRESULT Description::FinishMasterMob() {
     NCF_RETURN(AddMasterMobAttributes(pDictionary,pMasterMob));
     return NCF_OK;
 }
-
-// clang-format on
 
 }  // namespace
 

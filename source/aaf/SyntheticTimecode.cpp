@@ -53,7 +53,6 @@ void TellDate(const NCFSmartPtr<INCFConsole>& console, const std::tm& date) {
 
 }  // namespace
 
-// clang-format off
 NCFRESULT AddSyntheticTimeCode(std::tr1::shared_ptr<BaseClip> media, ncfUInt32* totalExistingSlots,
                                NCFSmartPtr<INCFConsole> pConsole,
                                IAAFSmartPointer<IAAFDictionary> pDictionary,
@@ -86,11 +85,12 @@ NCFRESULT AddSyntheticTimeCode(std::tr1::shared_ptr<BaseClip> media, ncfUInt32* 
     const ncfUInt32 maxDuration = GetMaxDuration(numFPS, false);
     ncfUInt32 tcTrackNum = *totalExistingSlots;
     const aafTimecode_t timecode = {0, kAAFTcNonDrop, numFPS};
-    NCF_RETURN(AddTimecodeAAFTrack( timecode, tcTrackNum++, (*totalExistingSlots)++, aafEditRate, maxDuration, 0, 0, pDictionary, pMobSourceMob));
+    NCF_RETURN(AddTimecodeAAFTrack( timecode, tcTrackNum++, (*totalExistingSlots)++, aafEditRate,
+                                   maxDuration, 0, 0, pDictionary, pMobSourceMob));
     const aafTimecode_t auxTimecode = {tcInFrames, kAAFTcDrop, numFPS};
-    NCF_RETURN(AddTimecodeAAFTrack( auxTimecode, tcTrackNum, (*totalExistingSlots)++, aafEditRate, movieLength, maxDuration, 0, pDictionary, pMobSourceMob));
+    NCF_RETURN(AddTimecodeAAFTrack( auxTimecode, tcTrackNum, (*totalExistingSlots)++, aafEditRate,
+                                   movieLength, maxDuration, 0, pDictionary, pMobSourceMob));
     return NCF_OK;
 }
-// clang-format on
 
 }  // namespace NMA::Impl

@@ -42,9 +42,6 @@ struct TrackMaker : ClipDescription {
     NCFRESULT AddSoundSlots();
 };
 
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-// clang-format off
-
 NCFRESULT TrackMaker::ReadTiming() {
     NCF_RETURN(media->GetEditRate(&movieEditRate));
     NCF_RETURN(media->GetMovieLength(&movieLength));
@@ -58,7 +55,8 @@ NCFRESULT TrackMaker::AddTimecodeSlots() {
     ncfUInt32 tcTrackCount = 0;
     NCF_RETURN(media->GetTimeCodeTrackCount(&tcTrackCount));
     if (tcTrackCount == 0) {
-        NCF_RETURN(AddSyntheticTimeCode(media, &totalExistingSlots, pConsole, pDictionary, pMobSourceMob));
+        NCF_RETURN(
+            AddSyntheticTimeCode(media, &totalExistingSlots, pConsole, pDictionary, pMobSourceMob));
         return NCF_OK;
     }
     for (ncfUInt32 tc_track = 0; tc_track < tcTrackCount; ++tc_track) {
@@ -67,7 +65,8 @@ NCFRESULT TrackMaker::AddTimecodeSlots() {
         TimeCodeTrackMetadata tcInfo;
         if (media->GetTimeCodeTrackMetadata(qtTrack, &tcInfo) < 0) {
             pConsole->Write(2, "TimeCode track metadata incomplete.\n");
-            NCF_RETURN(AddSyntheticTimeCode(media, &totalExistingSlots, pConsole, pDictionary, pMobSourceMob));
+            NCF_RETURN(AddSyntheticTimeCode(media, &totalExistingSlots, pConsole, pDictionary,
+                                            pMobSourceMob));
             break;
         }
         const NCFRESULT added = AddTimecodeSlot(tcInfo);
@@ -97,7 +96,8 @@ NCFRESULT TrackMaker::AddTimecodeSlot(const TimeCodeTrackMetadata& tcInfo) {
     const aafTimecode_t timecode = {0, drop ? kAAFTcDrop : kAAFTcNonDrop, (aafUInt16)fps};
     const ncfUInt32 maxDuration = GetMaxDuration(fps, false);
     const ncfUInt32 startingSlot = totalExistingSlots;
-    NCF_RETURN(AddTimecodeAAFTrack(timecode, startingSlot, totalExistingSlots++, aaf_rate, maxDuration, maxDuration, 0, pDictionary, pMobSourceMob));
+    NCF_RETURN(AddTimecodeAAFTrack(timecode, startingSlot, totalExistingSlots++, aaf_rate,
+                                   maxDuration, maxDuration, 0, pDictionary, pMobSourceMob));
     return NCF_OK;
 }
 
@@ -105,7 +105,8 @@ NCFRESULT TrackMaker::AddTimecodeSlot(const TimeCodeTrackMetadata& tcInfo) {
 // the same is a picture, and no descriptor of one is made without the retriever.
 NCFRESULT TrackMaker::PrepareRetriever(ncfUInt32 videoTrackCount, ncfUInt32 videoSlots) {
     if (videoTrackCount != 0) {
-        NCF_RETURN(QuickTimeToAAFInfoRetriever::Init(pConsole, pComponentFactory, fourCharXML, AAFInfoXML));
+        NCF_RETURN(QuickTimeToAAFInfoRetriever::Init(pConsole, pComponentFactory, fourCharXML,
+                                                     AAFInfoXML));
     }
     if (videoSlots != 0) {
         NCFASSERT(QuickTimeToAAFInfoRetriever::GetInstance());
@@ -126,10 +127,14 @@ NCFRESULT TrackMaker::AddPictureSlots() {
     const aafUID_t& dataDefUID = kAAFDataDef_LegacyPicture;
     const aafCharacter slotFormatLabel[] = L"V%d";
     for (ncfUInt32 slot = 0; slot < videoSlots; ++slot) {
-        NCF_RETURN(AddVideoDescriptor(media, pConsole, pMobMasterMob, pHeader, pDictionary, pMultiDescriptor));
+        NCF_RETURN(AddVideoDescriptor(media, pConsole, pMobMasterMob, pHeader, pDictionary,
+                                      pMultiDescriptor));
         const ncfUInt32 slotsToAdd = 1;
         const ncfUInt32 startingSlot = totalExistingSlots;
-        NCF_RETURN(AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, totalExistingSlots++, aaf_rate, movieLength, pDictionary, pMobMasterMob, pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 ));
+        NCF_RETURN(AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot,
+                               totalExistingSlots++, aaf_rate, movieLength, pDictionary,
+                               pMobMasterMob, pMasterMob, pMobFileMob, pFileMob, pMobSourceMob,
+                               pSourceMob, 0 ));
     }
     return NCF_OK;
 }
@@ -143,14 +148,16 @@ NCFRESULT TrackMaker::AddSoundSlots() {
     for (ncfUInt32 audio_track = 0; audio_track < audioTrackCount; ++audio_track) {
         ncfUInt32 slotsToAdd = 1;
         const ncfUInt32 startingSlot = totalExistingSlots;
-        NCF_RETURN(AddAudioDescriptor( media, audio_track, pConsole, pMobMasterMob, pDictionary, pMultiDescriptor, slotsToAdd));
-        NCF_RETURN(AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, totalExistingSlots, aaf_rate, movieLength, pDictionary, pMobMasterMob, pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 ));
+        NCF_RETURN(AddAudioDescriptor( media, audio_track, pConsole, pMobMasterMob, pDictionary,
+                                      pMultiDescriptor, slotsToAdd));
+        NCF_RETURN(AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot,
+                               totalExistingSlots, aaf_rate, movieLength, pDictionary,
+                               pMobMasterMob, pMasterMob, pMobFileMob, pFileMob, pMobSourceMob,
+                               pSourceMob, 0 ));
         totalExistingSlots += slotsToAdd;
     }
     return NCF_OK;
 }
-
-// clang-format on
 
 }  // namespace
 

@@ -22,7 +22,6 @@
 
 namespace NMA::Impl {
 
-// clang-format off
 NCFRESULT FixMultiDescSampleRate(IAAFSmartPointer<IAAFMultipleDescriptor> pMultiDesc,
                                  const aafRational_t& sampleRate) {
     NCF_FUNCTION("NMA::Impl::FixMultiDescSampleRate");
@@ -36,7 +35,6 @@ NCFRESULT FixMultiDescSampleRate(IAAFSmartPointer<IAAFMultipleDescriptor> pMulti
     }
     return NCF_OK;
 }
-// clang-format on
 
 namespace {
 
@@ -122,9 +120,6 @@ NCFRESULT PictureDescriptor::ChooseRoad() {
     return NCF_OK;
 }
 
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-// clang-format off
-
 NCFRESULT PictureDescriptor::Create() {
     if (directAccess && IsMPEG()) {
         const NCFRESULT created = CreateMPEG();
@@ -133,9 +128,11 @@ NCFRESULT PictureDescriptor::Create() {
         }
     } else if (directAccess && IsRGBA()) {
         AAFDefs defs(pDictionary);
-        NCF_RETURN(defs.cdRGBADescriptor()->CreateInstance(IID_IAAFRGBADescriptor2, (IUnknown **)&pRGBADescriptor));
+        NCF_RETURN(defs.cdRGBADescriptor()->CreateInstance(IID_IAAFRGBADescriptor2,
+                                                           (IUnknown **)&pRGBADescriptor));
     } else {
-        NCF_RETURN(pDictionary->CreateInstance(AUID_AAFCDCIDescriptor, IID_IAAFCDCIDescriptor, (IUnknown**)&pCDCIDescriptor));
+        NCF_RETURN(pDictionary->CreateInstance(AUID_AAFCDCIDescriptor, IID_IAAFCDCIDescriptor,
+                                               (IUnknown**)&pCDCIDescriptor));
     }
     if (!IsRGBA()) {
         NCF_RETURN(pCDCIDescriptor->Initialize());
@@ -145,7 +142,8 @@ NCFRESULT PictureDescriptor::Create() {
 
 NCFRESULT PictureDescriptor::CreateMPEG() {
     AAFDefs defs(pDictionary);
-    NCF_RETURN(defs.cdMPEGVideoDescriptor()->CreateInstance(IID_IAAFMPEGVideoDescriptor, (IUnknown **)&pMPEGDescriptor));
+    NCF_RETURN(defs.cdMPEGVideoDescriptor()->CreateInstance(IID_IAAFMPEGVideoDescriptor,
+                                                            (IUnknown **)&pMPEGDescriptor));
     NCF_RETURN(pMPEGDescriptor->Initialize());
     NCF_RETURN(pMPEGDescriptor->SetMaxGOP((aafUInt16)aafInfo.maxGOP));
     NCF_RETURN(pMPEGDescriptor->SetBitRate(aafInfo.bitRate));
@@ -156,13 +154,19 @@ NCFRESULT PictureDescriptor::CreateMPEG() {
 
 NCFRESULT PictureDescriptor::QueryViews() {
     if (IsRGBA()) {
-        NCF_RETURN(pRGBADescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor, (void **)&pDigitalImageDescriptor));
-        NCF_RETURN(pRGBADescriptor->QueryInterface(IID_IAAFFileDescriptor, (void **)&pFileDescriptor));
-        NCF_RETURN(pRGBADescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor2, (void **)&pDigitalImageDescriptor2));
+        NCF_RETURN(pRGBADescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor,
+                                                   (void **)&pDigitalImageDescriptor));
+        NCF_RETURN(
+            pRGBADescriptor->QueryInterface(IID_IAAFFileDescriptor, (void **)&pFileDescriptor));
+        NCF_RETURN(pRGBADescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor2,
+                                                   (void **)&pDigitalImageDescriptor2));
     } else {
-        NCF_RETURN(pCDCIDescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor, (void **)&pDigitalImageDescriptor));
-        NCF_RETURN(pCDCIDescriptor->QueryInterface(IID_IAAFFileDescriptor, (void **)&pFileDescriptor));
-        NCF_RETURN(pCDCIDescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor2, (void **)&pDigitalImageDescriptor2));
+        NCF_RETURN(pCDCIDescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor,
+                                                   (void **)&pDigitalImageDescriptor));
+        NCF_RETURN(
+            pCDCIDescriptor->QueryInterface(IID_IAAFFileDescriptor, (void **)&pFileDescriptor));
+        NCF_RETURN(pCDCIDescriptor->QueryInterface(IID_IAAFDigitalImageDescriptor2,
+                                                   (void **)&pDigitalImageDescriptor2));
     }
     return NCF_OK;
 }
@@ -199,7 +203,8 @@ NCFRESULT PictureDescriptor::TakeFrameLayoutFromClip(ncfUInt32 movieWidth, ncfUI
     } else if (told != NCF_OK) {
         return told;
     }
-    aafInfo.storedHeight = aafInfo.frameLayout == kAAFSeparateFields ? movieHeight / 2 : movieHeight;
+    aafInfo.storedHeight =
+        aafInfo.frameLayout == kAAFSeparateFields ? movieHeight / 2 : movieHeight;
     aafInfo.displayHeight = aafInfo.storedHeight;
     return NCF_OK;
 }
@@ -210,11 +215,13 @@ NCFRESULT PictureDescriptor::DescribeFromRecord() {
     }
     NCF_RETURN(pDigitalImageDescriptor2->SetFieldStartOffset( aafInfo.ImageStartOffset ));
     // A copy, since the library's integer is another type on some platforms.
-    std::vector<aafInt32> videoLineMap(aafInfo.videoLineMapVect.begin(), aafInfo.videoLineMapVect.end());
+    std::vector<aafInt32> videoLineMap(aafInfo.videoLineMapVect.begin(),
+                                       aafInfo.videoLineMapVect.end());
     NCF_RETURN_TEXT(
         "pDigitalImageDescriptor->SetVideoLineMap( (aafUInt32)aafInfo.videoLineMapVect.size(), "
         "(aafInt32*)&aafInfo.videoLineMapVect[0] )",
-        pDigitalImageDescriptor->SetVideoLineMap((aafUInt32)videoLineMap.size(), videoLineMap.data()));
+        pDigitalImageDescriptor->SetVideoLineMap((aafUInt32)videoLineMap.size(),
+                                                 videoLineMap.data()));
     aspectRatio = {(aafInt32)aafInfo.aspectNumerator, (aafInt32)aafInfo.aspectDenominator};
     return SetComponents();
 }
@@ -224,7 +231,8 @@ NCFRESULT PictureDescriptor::SetComponents() {
         NCF_RETURN_TEXT(
             "pRGBADescriptor->SetPixelLayout((aafUInt32)aafInfo.pixelLayout.size(),"
             "&aafInfo.pixelLayout[0])",
-            pRGBADescriptor->SetPixelLayout((aafUInt32)aafInfo.pixelLayout.size(), aafInfo.pixelLayout.data()));
+            pRGBADescriptor->SetPixelLayout((aafUInt32)aafInfo.pixelLayout.size(),
+                                            aafInfo.pixelLayout.data()));
         return NCF_OK;
     }
     NCF_RETURN(pCDCIDescriptor->SetComponentWidth( aafInfo.componentDepth ));
@@ -280,8 +288,10 @@ NCFRESULT PictureDescriptor::SetCoding() {
 NCFRESULT PictureDescriptor::SetContainer() {
     IAAFSmartPointer<IAAFContainerDef> pContainerDef;
     if (pDictionary->LookupContainerDef(containerFormatUID, &pContainerDef) != 0) {
-        NCF_RETURN(pDictionary->CreateInstance(AUID_AAFContainerDef, IID_IAAFContainerDef, (IUnknown**)&pContainerDef));
-        NCF_RETURN(pContainerDef->Initialize(containerFormatUID, (const aafCharacter*)L"", (const aafCharacter*)L""));
+        NCF_RETURN(pDictionary->CreateInstance(AUID_AAFContainerDef, IID_IAAFContainerDef,
+                                               (IUnknown**)&pContainerDef));
+        NCF_RETURN(pContainerDef->Initialize(containerFormatUID, (const aafCharacter*)L"",
+                                             (const aafCharacter*)L""));
         NCF_RETURN(pDictionary->RegisterContainerDef(pContainerDef));
     }
     NCF_RETURN(pFileDescriptor->SetContainerFormat(pContainerDef));
@@ -291,9 +301,11 @@ NCFRESULT PictureDescriptor::SetContainer() {
 NCFRESULT PictureDescriptor::SetViews() {
     NCF_RETURN(pDigitalImageDescriptor->SetFrameLayout(aafInfo.frameLayout));
     NCF_RETURN(pDigitalImageDescriptor->SetStoredView(aafInfo.storedHeight, aafInfo.storedWidth));
-    NCF_RETURN(pDigitalImageDescriptor->SetSampledView(aafInfo.storedHeight, aafInfo.sampledWidth, 0, 0));
+    NCF_RETURN(
+        pDigitalImageDescriptor->SetSampledView(aafInfo.storedHeight, aafInfo.sampledWidth, 0, 0));
     NCFASSERT(aafInfo.displayHeight && aafInfo.displayWidth);
-    NCF_RETURN(pDigitalImageDescriptor->SetDisplayView(aafInfo.displayHeight, aafInfo.displayWidth, 0, aafInfo.displayYOffset));
+    NCF_RETURN(pDigitalImageDescriptor->SetDisplayView(aafInfo.displayHeight, aafInfo.displayWidth,
+                                                       0, aafInfo.displayYOffset));
     NCF_RETURN(pDigitalImageDescriptor->SetImageAspectRatio( aspectRatio ));
     return NCF_OK;
 }
@@ -324,8 +336,6 @@ NCFRESULT PictureDescriptor::Append() {
     NCF_RETURN(pMultiDescriptor->AppendFileDescriptor( pFileDescriptor ));
     return NCF_OK;
 }
-
-// clang-format on
 
 }  // namespace
 

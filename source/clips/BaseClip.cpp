@@ -39,16 +39,19 @@ NCFRESULT BaseClip::LoadClipBase() {
 
     // A host without settings leaves the default in force.
     NCFSmartPtr<NMA::IHostSettings> hostSettings;
-    // clang-format off
     NCF_SKIP_TEXT(
-        "componentFactory_->CreateComponent(NMA::Impl::CompID_HostSettings, NULL, NMA::IID_IHostSettings, (void**)&hostSettings)",
-        ncfCreate(componentFactory_.inArg(), NMA::Impl::CompID_HostSettings, NMA::IID_IHostSettings, hostSettings));
+        "componentFactory_->CreateComponent(NMA::Impl::CompID_HostSettings, NULL, "
+        "NMA::IID_IHostSettings, (void**)&hostSettings)",
+        ncfCreate(componentFactory_.inArg(), NMA::Impl::CompID_HostSettings, NMA::IID_IHostSettings,
+                  hostSettings));
     if (hostSettings) {
         NCF_SKIP_TEXT(
-            "hostSettings->GetHostSettingBoolean(NMA::NMAHostSetting_IgnoreAlpha, NMA::IHostSettings::kUserScope, &ignoreAlpha_)",
-            hostSettings->GetHostSettingBoolean(NMA::NMAHostSetting_IgnoreAlpha, NMA::IHostSettings::kUserScope, &picture_.ignoreAlpha));
+            "hostSettings->GetHostSettingBoolean(NMA::NMAHostSetting_IgnoreAlpha, "
+            "NMA::IHostSettings::kUserScope, &ignoreAlpha_)",
+            hostSettings->GetHostSettingBoolean(NMA::NMAHostSetting_IgnoreAlpha,
+                                                NMA::IHostSettings::kUserScope,
+                                                &picture_.ignoreAlpha));
     }
-    // clang-format on
     loaded_ = 1;
     return NCF_OK;
 }

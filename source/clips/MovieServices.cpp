@@ -5,17 +5,16 @@
 
 #include "source/plugin/ResultChecks.h"
 
-// clang-format off
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-
 // A wrapper whose movie failed to open is kept: the movie is not tried again,
 // and the wrapper answers every question with a failure.
 NCFRESULT MovieServices::GetQuickTimeInterface(NCFSmartPtr<QTWrapper::IQuickTimeWrapper>& out) {
     NCF_FUNCTION("BaseClip::GetQuickTimeInterface");
     if (qtWrapper_.isNull()) {
         NCF_RETURN_TEXT(
-            "componentFactory_->CreateComponent(QTWrapper::CompID_QuickTimeWrapper, NULL, QTWrapper::IID_IQuickTimeWrapper, (void **)&qtWrapper_)",
-            ncfCreate(componentFactory_.inArg(), QTWrapper::CompID_QuickTimeWrapper, QTWrapper::IID_IQuickTimeWrapper, qtWrapper_));
+            "componentFactory_->CreateComponent(QTWrapper::CompID_QuickTimeWrapper, NULL, "
+            "QTWrapper::IID_IQuickTimeWrapper, (void **)&qtWrapper_)",
+            ncfCreate(componentFactory_.inArg(), QTWrapper::CompID_QuickTimeWrapper,
+                      QTWrapper::IID_IQuickTimeWrapper, qtWrapper_));
         NCF_RETURN_TEXT("qtWrapper_->NewMovieFromFilePath(fileName_)",
                         qtWrapper_->NewMovieFromFilePath(fileName_.inArg()));
     }
@@ -47,14 +46,16 @@ NCFRESULT MovieServices::GetQuickTimeAudioReader(NCFSmartPtr<QTWrapper::IQTAudio
     return NCF_OK;
 }
 
-NCFRESULT MovieServices::GetQuickTimePropertyComponent(NCFSmartPtr<QuickTime::IQuickTimeProperty>& out) {
+NCFRESULT MovieServices::GetQuickTimePropertyComponent(
+    NCFSmartPtr<QuickTime::IQuickTimeProperty>& out) {
     NCF_FUNCTION("BaseClip::GetQuickTimePropertyComponent");
     if (qtProperty_.isNull()) {
         NCF_RETURN_TEXT(
-            "(componentFactory_.inArg())->CreateComponent(QuickTime::CompID_QuickTimeProperty, NULL, QuickTime::IID_IQuickTimeProperty, (void**)&qtProperty_)",
-            ncfCreate(componentFactory_.inArg(), QuickTime::CompID_QuickTimeProperty, QuickTime::IID_IQuickTimeProperty, qtProperty_));
+            "(componentFactory_.inArg())->CreateComponent(QuickTime::CompID_QuickTimeProperty, "
+            "NULL, QuickTime::IID_IQuickTimeProperty, (void**)&qtProperty_)",
+            ncfCreate(componentFactory_.inArg(), QuickTime::CompID_QuickTimeProperty,
+                      QuickTime::IID_IQuickTimeProperty, qtProperty_));
     }
     out = qtProperty_;
     return NCF_OK;
 }
-// clang-format on

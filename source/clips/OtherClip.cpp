@@ -39,10 +39,8 @@ NCFRESULT OtherClip::LoadClipImpl() {
     // Some containers don't tell of an alpha channel that the codec delivers.
     ncfBool has_alpha_import = 0;
     ncfBool has_alpha_nma = 0;
-    // clang-format off
     NCF_RETURN(qtWrapper->MovieContainsAlpha(QTWrapper::kAlphaCheckForImport, &has_alpha_import));
     NCF_RETURN(qtWrapper->MovieContainsAlpha(QTWrapper::kAlphaCheckForQTNMA, &has_alpha_nma));
-    // clang-format on
     picture_.hasAlpha = has_alpha_import || has_alpha_nma;
     if (picture_.hasAlpha) {
         slog::Progress(ncfFunction) << "Movie has alpha!";
@@ -88,11 +86,10 @@ NCFRESULT OtherClip::GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& 
     NCF_FUNCTION("OtherClip::GetCodecName");
     ncfUInt32 track = 0;
     NCF_RETURN(GetFirstVideoTrack(track));
-    // clang-format off
     NCF_RETURN_TEXT(
-        "(componentFactory_.inArg())->CreateComponent(NCFCompID_NCFString, 0, IID_PPV_ARG(INCFString, &codecName))",
+        "(componentFactory_.inArg())->CreateComponent(NCFCompID_NCFString, 0, "
+        "IID_PPV_ARG(INCFString, &codecName))",
         ncfCreate(componentFactory_.inArg(), NCFCompID_NCFString, IID_INCFString, codecName));
-    // clang-format on
     if (IsNativeQuickTimeCodec(codecType)) {
         NCF_RETURN(GetNativeQuickTimeCodecName(codecType, codecName));
         return NCF_OK;

@@ -7,9 +7,6 @@
 #include "source/clips/OtherClip.h"
 #include "source/plugin/ResultChecks.h"
 
-// clang-format off
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-
 NCFRESULT OtherClip::GetNumSamples(ncfUInt32 qtTrack, ncfUInt64* numSamples) {
     NCF_FUNCTION("OtherClip::GetNumSamples");
     CHK_INARG(numSamples);
@@ -18,7 +15,8 @@ NCFRESULT OtherClip::GetNumSamples(ncfUInt32 qtTrack, ncfUInt64* numSamples) {
     return NCF_OK;
 }
 
-NCFRESULT OtherClip::GetDataOffset(ncfUInt32 qtTrack, ncfUInt64 sampleNum, ncfUInt64* samplePosition) {
+NCFRESULT OtherClip::GetDataOffset(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
+                                   ncfUInt64* samplePosition) {
     NCF_FUNCTION("OtherClip::GetDataOffset");
     CHK_INARG(samplePosition);
     CHK_PTR(sampleTable_);
@@ -31,21 +29,26 @@ NCFRESULT OtherClip::GetSampleFlags(ncfUInt32 qtTrack, ncfUInt64 sampleNum, ncfU
     CHK_INARG(flags);
     CHK_PTR(sampleTable_);
     QTWrapper::QTWSamplePropertyFlags_t properties{};
-    NCF_RETURN_TEXT("sampleTable_->GetSampleFlags(qtTrack, sampleNum, (QTWrapper::QTWSamplePropertyFlags_t*)flags)",
-                    sampleTable_->GetSampleFlags(qtTrack, sampleNum, &properties));
+    NCF_RETURN_TEXT(
+        "sampleTable_->GetSampleFlags(qtTrack, sampleNum, "
+        "(QTWrapper::QTWSamplePropertyFlags_t*)flags)",
+        sampleTable_->GetSampleFlags(qtTrack, sampleNum, &properties));
     *flags = properties;
     return NCF_OK;
 }
 
-NCFRESULT OtherClip::GetNextDiscontiguousDataAttributeChange(ncfUInt32 qtTrack, ncfUInt64 sampleNum, ncfUInt64* lastSample) {
+NCFRESULT OtherClip::GetNextDiscontiguousDataAttributeChange(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
+                                                             ncfUInt64* lastSample) {
     NCF_FUNCTION("OtherClip::GetNextDiscontiguousDataAttributeChange");
     CHK_INARG(lastSample);
     CHK_PTR(sampleTable_);
-    NCF_RETURN(sampleTable_->GetNextDiscontiguousDataAttributeChange(qtTrack, sampleNum, lastSample));
+    NCF_RETURN(
+        sampleTable_->GetNextDiscontiguousDataAttributeChange(qtTrack, sampleNum, lastSample));
     return NCF_OK;
 }
 
-NCFRESULT OtherClip::GetDataSizePerSample(ncfUInt32 qtTrack, ncfUInt64 sampleNum, ncfUInt32* dataSizeInBytes) {
+NCFRESULT OtherClip::GetDataSizePerSample(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
+                                          ncfUInt32* dataSizeInBytes) {
     NCF_FUNCTION("OtherClip::GetDataSizePerSample");
     CHK_INARG(dataSizeInBytes);
     CHK_PTR(sampleTable_);
@@ -53,7 +56,8 @@ NCFRESULT OtherClip::GetDataSizePerSample(ncfUInt32 qtTrack, ncfUInt64 sampleNum
     return NCF_OK;
 }
 
-NCFRESULT OtherClip::GetDisplayOffset(ncfUInt32 qtTrack, ncfUInt64 sampleNum, ncfSInt64* outOffset) {
+NCFRESULT OtherClip::GetDisplayOffset(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
+                                      ncfSInt64* outOffset) {
     NCF_FUNCTION("OtherClip::GetDisplayOffset");
     CHK_INARG(outOffset);
     CHK_PTR(sampleTable_);
@@ -61,14 +65,14 @@ NCFRESULT OtherClip::GetDisplayOffset(ncfUInt32 qtTrack, ncfUInt64 sampleNum, nc
     return NCF_OK;
 }
 
-NCFRESULT OtherClip::GetDecodeDuration(ncfUInt32 qtTrack, ncfUInt64 sampleNum, ncfSInt64* decodeDuration) {
+NCFRESULT OtherClip::GetDecodeDuration(ncfUInt32 qtTrack, ncfUInt64 sampleNum,
+                                       ncfSInt64* decodeDuration) {
     NCF_FUNCTION("OtherClip::GetDecodeDuration");
     CHK_INARG(decodeDuration);
     CHK_PTR(sampleTable_);
     NCF_RETURN(sampleTable_->GetDecodeDuration(qtTrack, sampleNum, decodeDuration));
     return NCF_OK;
 }
-// clang-format on
 
 NCFRESULT OtherClip::GetMaxDataSizeInBytes(ncfUInt32 qtTrack, ncfUInt32* maxDataSize) {
     NCF_FUNCTION("OtherClip::GetMaxDataSizeInBytes");

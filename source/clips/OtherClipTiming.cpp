@@ -30,14 +30,18 @@ NCFRESULT OtherClip::SetEditRateAndLengthImpl(const EditorSettings& editorSettin
         editorSettings._movieDurationCalculationToUse == EditorSettings::kUseMovieHeader;
     Rational movieEditRate;
     ncfUInt64 length = 0;
-    // clang-format off
     NCF_RETURN_TEXT(
-        "qtWrapper_->DetermineMovieEditRateAndLength( editorSettings._areSettingsValid && editorSettings._forcedFrameRateEnabled ? editorSettings._forcedFrameRate : 0.0, editorSettings._areSettingsValid ? editorSettings._editorFrameRate : 0.0, editorSettings._areSettingsValid ? editorSettings._singleFrameDuration : 0, &movieEditRate.numerator, &movieEditRate.denominator, &length_, trackLengthInFramesArray.get(), TRACKLENGTH_ARRAY_LEN, editorSettings._movieDurationCalculationToUse == EditorSettings::kUseMovieHeader )",
+        "qtWrapper_->DetermineMovieEditRateAndLength( editorSettings._areSettingsValid && "
+        "editorSettings._forcedFrameRateEnabled ? editorSettings._forcedFrameRate : 0.0, "
+        "editorSettings._areSettingsValid ? editorSettings._editorFrameRate : 0.0, "
+        "editorSettings._areSettingsValid ? editorSettings._singleFrameDuration : 0, "
+        "&movieEditRate.numerator, &movieEditRate.denominator, &length_, "
+        "trackLengthInFramesArray.get(), TRACKLENGTH_ARRAY_LEN, "
+        "editorSettings._movieDurationCalculationToUse == EditorSettings::kUseMovieHeader )",
         qtWrapper_->DetermineMovieEditRateAndLength(
             forcedRate, editorRate, singleFrameDuration, &movieEditRate.numerator,
             &movieEditRate.denominator, &length, trackLengthInFramesArray.data(), trackCount,
             useMovieHeader));
-    // clang-format on
     if (length == 0) {
         console_->Write(1, "The length of the movie can't be determined.\n");
         return NMA_E_NOTINITIALIZED;
@@ -55,7 +59,7 @@ NCFRESULT OtherClip::CalculateAudioTrackLengthInSamples(ncfUInt32 qtTrack, ncfUI
     AudioTrackMetadata audioInfo;
     NCF_RETURN(GetAudioTrackMetadata(qtTrack, &audioInfo));
     const auto duration = static_cast<double>(qtWrapper_->GetTrackDuration(qtTrack));
-    const double seconds = duration / qtWrapper_->GetMovieTimeScale();
-    *trackLength = TruncateToUInt64(seconds * audioInfo.sampleRate + 0.5);
+    *trackLength = TruncateToUInt64(
+        UnitsIn(duration, qtWrapper_->GetMovieTimeScale(), audioInfo.sampleRate) + 0.5);
     return NCF_OK;
 }

@@ -123,9 +123,10 @@ NCFRESULT OtherClip::GetTimeCodeTrackMetadata(ncfUInt32 qtTrack, TimeCodeTrackMe
     CHK_PTR(tcInfo);
     CHK_PTR(qtWrapper_);
     *tcInfo = TimeCodeTrackMetadata();
-    // clang-format off
-    NCF_RETURN(qtWrapper_->GetTimeCodeInfoForTrack(qtTrack, &tcInfo->hours, &tcInfo->minutes, &tcInfo->seconds, &tcInfo->frames, &tcInfo->timeScale, &tcInfo->frameDuration, &tcInfo->drop, &tcInfo->numFrames));
-    // clang-format on
+    NCF_RETURN(qtWrapper_->GetTimeCodeInfoForTrack(qtTrack, &tcInfo->hours, &tcInfo->minutes,
+                                                   &tcInfo->seconds, &tcInfo->frames,
+                                                   &tcInfo->timeScale, &tcInfo->frameDuration,
+                                                   &tcInfo->drop, &tcInfo->numFrames));
     return NCF_OK;
 }
 
@@ -134,9 +135,11 @@ NCFRESULT OtherClip::GetAudioTrackMetadata(ncfUInt32 qtTrack, AudioTrackMetadata
     CHK_PTR(audioInfo);
     CHK_PTR(qtWrapper_);
     *audioInfo = AudioTrackMetadata();
-    // clang-format off
-    NCF_RETURN(qtWrapper_->GetAudioInfoForTrack(qtTrack, &audioInfo->channelsPerFrame, &audioInfo->sampleRate, &audioInfo->formatID, NULL, &audioInfo->bytesPerPacket, NULL, &audioInfo->bitsPerChannel, &audioInfo->isBigEndian, &audioInfo->isConstantBitRate));
-    // clang-format on
+    NCF_RETURN(qtWrapper_->GetAudioInfoForTrack(qtTrack, &audioInfo->channelsPerFrame,
+                                                &audioInfo->sampleRate, &audioInfo->formatID, NULL,
+                                                &audioInfo->bytesPerPacket, NULL,
+                                                &audioInfo->bitsPerChannel, &audioInfo->isBigEndian,
+                                                &audioInfo->isConstantBitRate));
     return NCF_OK;
 }
 

@@ -38,11 +38,10 @@ NCFRESULT QuickTimeClip::LoadClipImpl() {
     if (loaded_ == 1) {
         return NCF_OK;
     }
-    // clang-format off
     NCF_RETURN_TEXT(
-        "componentFactory_->CreateComponent(NCFCompID_QTParser, NULL, IID_IQTParser, (void **)&qtParser_)",
+        "componentFactory_->CreateComponent(NCFCompID_QTParser, NULL, IID_IQTParser, (void "
+        "**)&qtParser_)",
         ncfCreate(componentFactory_.inArg(), NCFCompID_QTParser, IID_IQTParser, qtParser_));
-    // clang-format on
     NCF_RETURN(ParseMediaHeaders());
 
     ncfUInt32 videoTrackCount = 0;
@@ -152,11 +151,10 @@ NCFRESULT QuickTimeClip::IsMultiFormatMovie(ncfBool* isMultiformat) {
 
 NCFRESULT QuickTimeClip::GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) {
     NCF_FUNCTION("QuickTimeClip::GetCodecName");
-    // clang-format off
     NCF_RETURN_TEXT(
-        "(componentFactory_.inArg())->CreateComponent(NCFCompID_NCFString, 0, IID_PPV_ARG(INCFString, &codecName))",
+        "(componentFactory_.inArg())->CreateComponent(NCFCompID_NCFString, 0, "
+        "IID_PPV_ARG(INCFString, &codecName))",
         ncfCreate(componentFactory_.inArg(), NCFCompID_NCFString, IID_INCFString, codecName));
-    // clang-format on
     if (IsNativeQuickTimeCodec(codecType)) {
         NCF_RETURN(GetNativeQuickTimeCodecName(codecType, codecName));
         return NCF_OK;

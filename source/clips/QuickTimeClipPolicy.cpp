@@ -18,9 +18,7 @@ NCFRESULT QuickTimeClip::IsAudioSampleProviderMedia(ncfUInt32 qtTrack, ncfUInt64
     NCF_RETURN(GetAudioTrack(qtTrack, ati.outArg()));
     ncfBool linear = 0;
     ncfBool areMediaAndTrackTimesProportional = 0;
-    // clang-format off
     NCF_RETURN(ati->IsTrackLinear(&linear, &areMediaAndTrackTimesProportional, NULL, NULL));
-    // clang-format on
     if (!areMediaAndTrackTimesProportional) {
         rule_.TellReason(ncfFunction, "The audio track contains non-trivial edit list(s).");
         return 0;

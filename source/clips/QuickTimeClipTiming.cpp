@@ -97,8 +97,7 @@ NCFRESULT QuickTimeClip::SetAVMovieLength() {
     }
     ncfUInt32 trackDuration = 0;
     NCF_RETURN(vti->GetTrackDuration(&trackDuration));
-    const double duration = trackDuration;
-    length_ = TruncateToUInt64(duration / timescale * editRate_.ToDouble() + 0.5);
+    length_ = TruncateToUInt64(UnitsIn(trackDuration, timescale, editRate_.ToDouble()) + 0.5);
     return NCF_OK;
 }
 
@@ -110,9 +109,7 @@ NCFRESULT QuickTimeClip::SetOnlyAudioMovieLength() {
     ncfUInt32 movieDuration = 0;
     NCF_RETURN(qtParser_->GetTimeScale(&movieTimescale));
     NCF_RETURN(qtParser_->GetMovieDuration(&movieDuration));
-    const double duration = movieDuration;
-    const double timescale = movieTimescale;
-    length_ = TruncateToUInt64(duration / timescale * editRate_.ToDouble());
+    length_ = TruncateToUInt64(UnitsIn(movieDuration, movieTimescale, editRate_.ToDouble()));
     return NCF_OK;
 }
 
@@ -129,8 +126,8 @@ NCFRESULT QuickTimeClip::CalculateAudioTrackLengthInSamples(ncfUInt32 qtTrack,
     NCF_RETURN(GetAudioTrackMetadata(qtTrack, &audioInfo));
     NCF_RETURN(ati->GetTrackDuration(&trackDuration));
     NCF_RETURN(qtParser_->GetTimeScale(&movieTimescale));
-    const double seconds = static_cast<double>(trackDuration) / movieTimescale;
-    *trackNumSamples = TruncateToUInt64(seconds * audioInfo.sampleRate + 0.5);
+    *trackNumSamples =
+        TruncateToUInt64(UnitsIn(trackDuration, movieTimescale, audioInfo.sampleRate) + 0.5);
     return NCF_OK;
 }
 
@@ -147,7 +144,7 @@ NCFRESULT QuickTimeClip::CalculateMediaOnTrackLengthInSamples(ncfUInt32 qtTrack,
     NCF_RETURN(GetAudioTrackMetadata(qtTrack, &audioInfo));
     NCF_RETURN(ati->GetMediaDuration(&mediaOnTrackDuration));
     NCF_RETURN(ati->GetMediaTS(&mediaTimescale));
-    const double seconds = static_cast<double>(mediaOnTrackDuration) / mediaTimescale;
-    *mediaNumSamples = TruncateToUInt64(seconds * audioInfo.sampleRate + 0.5);
+    *mediaNumSamples =
+        TruncateToUInt64(UnitsIn(mediaOnTrackDuration, mediaTimescale, audioInfo.sampleRate) + 0.5);
     return NCF_OK;
 }

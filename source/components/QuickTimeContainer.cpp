@@ -67,7 +67,6 @@ NCFRESULT QuickTimeContainer::GetAAFMasterClips(IAAFClips** ppClips) {
         if (filePath_->IsEmpty()) {
             return NMA_E_NOTINITIALIZED;
         }
-        // clang-format off
         if (!media_) {
             NCF_RETURN(LoadMedia(filePath_, console_, componentFactory_, media_));
         }
@@ -85,7 +84,6 @@ NCFRESULT QuickTimeContainer::GetAAFMasterClips(IAAFClips** ppClips) {
             *ppClips = static_cast<IAAFClips*>(clips);
             return answered;
         }());
-        // clang-format on
         return NCF_OK;
     });
 }
@@ -123,10 +121,12 @@ NCFRESULT QuickTimeContainer::GetSampleMapping(ISampleMapping** ppSampleMapping)
         if (!ppSampleMapping) {
             return NCF_E_POINTER;
         }
-        // clang-format off
         NCFSmartPtr<ISampleMapping> created;
-        NCF_RETURN_TEXT("componentFactory_->CreateComponent(NMA::CompID_QuickTimeSampleMapping, NULL, IID_ISampleMapping, (void**)ppSampleMapping)",
-                        ncfCreate(componentFactory_.inArg(), NMA::CompID_QuickTimeSampleMapping, IID_ISampleMapping, created));
+        NCF_RETURN_TEXT(
+            "componentFactory_->CreateComponent(NMA::CompID_QuickTimeSampleMapping, NULL, "
+            "IID_ISampleMapping, (void**)ppSampleMapping)",
+            ncfCreate(componentFactory_.inArg(), NMA::CompID_QuickTimeSampleMapping,
+                      IID_ISampleMapping, created));
         auto* const pSampleMapping = dynamic_cast<QuickTimeSampleMapping*>(created.inArg());
         if (!pSampleMapping) {
             if (console_) {
@@ -139,7 +139,6 @@ NCFRESULT QuickTimeContainer::GetSampleMapping(ISampleMapping** ppSampleMapping)
             NCF_RETURN(LoadMedia(filePath_, console_, componentFactory_, media_));
         }
         NCF_RETURN(pSampleMapping->SetMediaContainer(media_));
-        // clang-format on
         *ppSampleMapping = created.detach();
         return NCF_OK;
     });

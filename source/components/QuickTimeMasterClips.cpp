@@ -59,12 +59,10 @@ NCFRESULT QuickTimeMasterClips::GetMetadata(ncfSInt32 index, IAAFFile** ppData) 
     }
     return ResultOf([&]() -> NCFRESULT {
         std::tr1::shared_ptr<BaseClip> media;
-        // clang-format off
         NCF_RETURN(LoadMedia(_MCList[index].InArg(), _pConsole, _pComponentFactory, media));
         *ppData = nullptr;
         NCF_RETURN_TEXT("NewAAFFromMovie(media, _pConsole, ppData, _pComponentFactory)",
                         NewAAFFromMovie(media, _pConsole, ppData, _pComponentFactory.inArg()));
-        // clang-format on
         return NCF_OK;
     });
 }

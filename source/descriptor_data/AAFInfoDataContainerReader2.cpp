@@ -95,9 +95,6 @@ bool AAFInfoDataContainerReader2::DescriptorFits(ncfUInt32 width, ncfUInt32 heig
            (width == storedWidth || width == sampledWidth);
 }
 
-// The checked statements below are logged as they are written here.
-// clang-format off
-
 NCFRESULT AAFInfoDataContainerReader2::GetUID(const char* name, aafUID_t* outUID) {
     NCF_FUNCTION("AAFInfoDataContainerReader2::GetUID");
     NCF_RETURN(GetMediaDescriptorSignature(m_curVCID, m_curWidth, m_curHeight));
@@ -161,8 +158,8 @@ NCFRESULT GetOnePropertyImpl(const XMLDataPropertyValue* pMediaDescriptorNode, c
 }
 
 NCFRESULT GetTwoPropertiesImpl(const XMLDataPropertyValue* pMediaDescriptorNode, const char* name,
-                               const char* subName1, const char* subName2,
-                               ncfUInt32* elementValue1, ncfUInt32* elementValue2) {
+                               const char* subName1, const char* subName2, ncfUInt32* elementValue1,
+                               ncfUInt32* elementValue2) {
     NCF_FUNCTION("GetTwoPropertiesImpl");
     CHK_INARG(elementValue1);
     CHK_INARG(elementValue2);
@@ -187,4 +184,3 @@ NCFRESULT GetTwoPropertiesImpl(const XMLDataPropertyValue* pMediaDescriptorNode,
     *elementValue2 = TextToNumber(property2ValueString.GetUTF8String());
     return NCF_OK;
 }
-// clang-format on

@@ -42,9 +42,6 @@ NCFRESULT AAFInfoDataContainerReader2::GetAspectRatioFromVCID(ncfUInt32* outNume
                             outNumerator, outDenominator);
 }
 
-// The checked statements below are logged as they are written here.
-// clang-format off
-
 NCFRESULT AAFInfoDataContainerReader2::GetProfileAndLevelFromVCID(ncfUInt8* outProfileAndLevel) {
     NCF_FUNCTION("AAFInfoDataContainerReader2::GetProfileAndLevelFromVCID");
     CHK_INARG(outProfileAndLevel);
@@ -105,4 +102,3 @@ NCFRESULT AAFInfoDataContainerReader2::GetPixelLayoutFromVCID(
     }
     return NCF_OK;
 }
-// clang-format on

@@ -105,7 +105,6 @@ NCFRESULT QTAttributesXMLParser::GetBox(QTBoxKind kind, BoundsBox* op_box) {
     if (!box) {
         return NMA_E_NODATA;
     }
-    // clang-format off
     NMAXmlElement* const positionXNode = FirstChild(box, "PositionX");
     NCFASSERT(positionXNode);
     NCF_RETURN(_GetNumerator(positionXNode,&op_box->positionX.numerator));
@@ -122,7 +121,6 @@ NCFRESULT QTAttributesXMLParser::GetBox(QTBoxKind kind, BoundsBox* op_box) {
     NCFASSERT(widthNode);
     NCF_RETURN(_GetNumerator(widthNode, &op_box->width.numerator));
     NCF_RETURN(_GetDenominator(widthNode, &op_box->width.denominator));
-    // clang-format on
     return NCF_OK;
 }
 

@@ -118,9 +118,6 @@ bool QuickTimeToAAFInfoRetriever::IsRGBADescriptor() const {
     return isRGBA;
 }
 
-// The checked statements below are logged as they are written here.
-// clang-format off
-
 NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const DescribedPicture* media,
                                                                    AAFInfo* aafInfo,
                                                                    ncfUInt32* vcid) {
@@ -152,9 +149,8 @@ NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const Describ
 
     *vcid = 0;
     const auto layout = static_cast<ncfUInt8>(aafInfo->frameLayout);
-    const NCFRESULT mapped = m_fourCharReader.GetVCID(InTextOrder(fourCC), width, height,
-                                                      &movieEditRate, &layout,
-                                                      InTextOrder(vendor), vcid);
+    const NCFRESULT mapped = m_fourCharReader.GetVCID(
+        InTextOrder(fourCC), width, height, &movieEditRate, &layout, InTextOrder(vendor), vcid);
     if (mapped == NCF_E_NOTSUPPORTED) {
         ReportUnknownCode(fourCC);
         return mapped;
@@ -167,7 +163,6 @@ NCFRESULT QuickTimeToAAFInfoRetriever::GetInfoFromImageDescription(const Describ
     }
     return FillInfo({*vcid, movieEditRate, width, height}, *aafInfo);
 }
-// clang-format on
 
 NCFRESULT QuickTimeToAAFInfoRetriever::FillInfo(const Query& query, AAFInfo& aafInfo) {
     const char* failedCall = nullptr;

@@ -7,9 +7,6 @@
 
 #include "source/plugin/ResultChecks.h"
 
-// The checked statements below are logged as they are written here.
-// clang-format off
-
 XMLDataPropertyValue::XMLDataPropertyValue(const XMLDataPropertyDescription* description)
     : description_(description) {
     if (!description) {
@@ -105,4 +102,3 @@ NCFRESULT XMLDataPropertyValue::FindPropertyInChildren(
     *dataPropertyValue = dataPropertyValueVect.front();
     return NCF_OK;
 }
-// clang-format on

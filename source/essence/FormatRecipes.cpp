@@ -15,55 +15,64 @@ using namespace QuickTime;
 const FormatRow kAlpha8 = {
     PF_Mono, CSS_None, CS_MONO, CT_UCHAR, CRT_UNDEFINED,
     {kBGRAPixelFormat, {4, 1}, {1, 1}, &ExtractAlpha8},
-    "AddImagePixelFormat(alpha_track, PF_Mono, CSS_None, CS_MONO, CT_UCHAR, CRT_UNDEFINED, qt_params)",
+    "AddImagePixelFormat(alpha_track, PF_Mono, CSS_None, CS_MONO, CT_UCHAR, CRT_UNDEFINED, "
+    "qt_params)",
     "Adding support for a8.\n"};
 
 const FormatRow kAlpha10FromB64a = {
     PF_Mono, CSS_None, CS_MONO, CT_10Bit, CRT_UNDEFINED,
     {kb64aPixelFormat, {8, 1}, {2, 1}, &ExtractAlpha10FromB64a},
-    "AddImagePixelFormat(alpha_track, PF_Mono, CSS_None, CS_MONO, CT_10Bit, CRT_UNDEFINED, qt_params)",
+    "AddImagePixelFormat(alpha_track, PF_Mono, CSS_None, CS_MONO, CT_10Bit, CRT_UNDEFINED, "
+    "qt_params)",
     "Adding support for a10.\n"};
 
 const FormatRow kAlpha10FromR4fl = {
     PF_Mono, CSS_None, CS_MONO, CT_10Bit, CRT_UNDEFINED,
     {kr4flPixelFormat, {16, 1}, {2, 1}, &ExtractAlpha10FromR4fl},
-    "AddImagePixelFormat(alpha_track, PF_Mono, CSS_None, CS_MONO, CT_10Bit, CRT_UNDEFINED, qt_params)",
+    "AddImagePixelFormat(alpha_track, PF_Mono, CSS_None, CS_MONO, CT_10Bit, CRT_UNDEFINED, "
+    "qt_params)",
     "Adding support for a10.\n"};
 
 const RGBRecipe kBGRAFullRange = {
     {PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_FullRange,
      {kBGRAPixelFormat, {4, 1}, {4, 1}, nullptr},
-     "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_FullRange, qt_params)",
+     "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_FullRange, "
+     "qt_params)",
      "Adding support for BGRA.\n"},
     &kAlpha8};
 
 const RGBRecipe kBGRAVideoRange = {
     {PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_VideoRange,
      {kBGRAPixelFormat, {4, 1}, {4, 1}, nullptr},
-     "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_VideoRange, qt_params)",
+     "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_VideoRange, "
+     "qt_params)",
      "Adding support for BGRA.\n"},
     &kAlpha8};
 
 const RGBRecipe kNVZ2 = {
     {PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_VideoRange,
      {kNVZ2PixelFormat, {4, 1}, {4, 1}, nullptr},
-     "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_VideoRange, qt_params)",
+     "AddImagePixelFormat(video_track, PF_BGRA, CSS_4444, CS_RGB, CT_UCHAR, CRT_VideoRange, "
+     "qt_params)",
      "Adding support for BGRA video range.\n"},
     nullptr};
 
 const RGBRecipe kB64a = {
     {PF_ARGB, CSS_4444, CS_RGB, CT_USHORT_BE_VideoRange, CRT_VideoRange,
      {kb64aPixelFormat, {8, 1}, {8, 1}, nullptr},
-     "AddImagePixelFormat(video_track, PF_ARGB, CSS_4444, CS_RGB, CT_USHORT_BE_VideoRange, CRT_VideoRange, qt_params)",
+     "AddImagePixelFormat(video_track, PF_ARGB, CSS_4444, CS_RGB, CT_USHORT_BE_VideoRange, "
+     "CRT_VideoRange, qt_params)",
      "Adding support for 'b64a'.\n"},
     &kAlpha10FromB64a};
 
 const RGBRecipe kR4fl = {
     {PF_ARGB, CSS_4444, CS_RGB, CT_USHORT_BE_VideoRange, CRT_VideoRange,
      {kr4flPixelFormat, {16, 1}, {8, 1}, &ConvertR4flToB64a},
-     "AddImagePixelFormat(video_track, PF_ARGB, CSS_4444, CS_RGB, CT_USHORT_BE_VideoRange, CRT_VideoRange, qt_params)",
+     "AddImagePixelFormat(video_track, PF_ARGB, CSS_4444, CS_RGB, CT_USHORT_BE_VideoRange, "
+     "CRT_VideoRange, qt_params)",
      "Adding support for 'r4fl'.\n"},
     &kAlpha10FromR4fl};
+// clang-format on
 
 struct Entry {
     ncfUInt32 fourCC;
@@ -78,7 +87,6 @@ const Entry kEntries[] = {
     {kb64aPixelFormat, &kB64a, &kB64a},
     {kr4flPixelFormat, &kR4fl, &kR4fl},
 };
-// clang-format on
 
 }  // namespace
 

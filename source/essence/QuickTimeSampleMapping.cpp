@@ -56,9 +56,6 @@ NCFRESULT QuickTimeSampleMapping::InternalQueryInterface(const GUID& iid, void**
     });
 }
 
-// clang-format off
-// Statements are logged as they stand.
-
 NCFRESULT QuickTimeSampleMapping::PrepareImageProvider() {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::InternalQueryInterface");
     if (imageFormatsReady_) {
@@ -93,8 +90,10 @@ NCFRESULT QuickTimeSampleMapping::QueryParametersXML(void** ppvObj) {
         NCF_RETURN(LoadMedia(_filePath, _pConsole, _pComponentFactory, media_));
     }
     NCFSmartPtr<INCFParametersXML> created;
-    NCF_RETURN_TEXT("_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, IID_INCFParametersXML, ppvObj)",
-                    ncfCreate(_pComponentFactory.inArg(), CompID_QTParameters, IID_INCFParametersXML, created));
+    NCF_RETURN_TEXT(
+        "_pComponentFactory->CreateComponent(CompID_QTParameters, NULL, IID_INCFParametersXML, "
+        "ppvObj)",
+        ncfCreate(_pComponentFactory.inArg(), CompID_QTParameters, IID_INCFParametersXML, created));
     // Only the module's own parameters can be attached.
     auto* const pParams = dynamic_cast<MappingAttachment*>(created.inArg());
     if (!pParams) {
@@ -157,7 +156,6 @@ NCFRESULT QuickTimeSampleMapping::SetupOrCleanup(ncfUInt32 trackNMA, bool setup)
     }
     return NCF_OK;
 }
-// clang-format on
 
 NCFRESULT QuickTimeSampleMapping::Setup(ncfUInt32 trackNMA) {
     return ResultOf([&] { return SetupOrCleanup(trackNMA, true); });

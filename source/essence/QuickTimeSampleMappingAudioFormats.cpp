@@ -11,10 +11,8 @@
 
 namespace NMA::Impl {
 
-// clang-format off
-// Statements are logged as they stand.
-
-NCFRESULT QuickTimeSampleMapping::GetNumberOfAudioFormats(ncfUInt32 trackNMA, ncfUInt32* numFormats) {
+NCFRESULT QuickTimeSampleMapping::GetNumberOfAudioFormats(ncfUInt32 trackNMA,
+                                                          ncfUInt32* numFormats) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfAudioFormats");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numFormats);
@@ -29,7 +27,9 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfAudioFormats(ncfUInt32 trackNMA, nc
     });
 }
 
-NCFRESULT QuickTimeSampleMapping::GetAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex, ncfUInt32* sampleFormat, ncfUInt16* bytesPerSample, ncfUInt16* bitsPerSample) {
+NCFRESULT QuickTimeSampleMapping::GetAudioFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex,
+                                                 ncfUInt32* sampleFormat, ncfUInt16* bytesPerSample,
+                                                 ncfUInt16* bitsPerSample) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetAudioFormat");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(sampleFormat);
@@ -75,14 +75,21 @@ NCFRESULT QuickTimeSampleMapping::SetWorkingAudioFormat(ncfUInt32 trackNMA, ncfU
         NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper;
         NCF_RETURN(media_->GetQuickTimeInterface(qtWrapper));
         double sampleRate = 0.0;
-        NCF_RETURN_TEXT("qtWrapper->GetAudioInfoForTrack(trackQT, NULL, &sampleRate, NULL, NULL, NULL, NULL, NULL, NULL, NULL)",
-                        qtWrapper->GetAudioInfoForTrack(trackQT, nullptr, &sampleRate, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr));
+        NCF_RETURN_TEXT(
+            "qtWrapper->GetAudioInfoForTrack(trackQT, NULL, &sampleRate, NULL, NULL, NULL, NULL, "
+            "NULL, NULL, NULL)",
+            qtWrapper->GetAudioInfoForTrack(trackQT, nullptr, &sampleRate, nullptr, nullptr,
+                                            nullptr, nullptr, nullptr, nullptr, nullptr));
         ncfUInt32 numAudioChannels = 1;
-        NCF_RETURN(_audioReaderHolder->SetParams(trackQT, bytesPerSample, audio_format->GetSampleFormat() == SF_PCM_INT_LE, sampleRate, numAudioChannels));
+        NCF_RETURN(_audioReaderHolder->SetParams(trackQT, bytesPerSample,
+                                                 audio_format->GetSampleFormat() == SF_PCM_INT_LE,
+                                                 sampleRate, numAudioChannels));
         AudioTrackMetadata audioInfo;
         NCF_RETURN(media_->GetAudioTrackMetadata(trackQT, &audioInfo));
         if (numAudioChannels != audioInfo.channelsPerFrame) {
-            slog::Warning(ncfFunction) << "numAudioChannels(" << numAudioChannels << ") != audioInfo.channelsPerFrame(" << audioInfo.channelsPerFrame << ")";
+            slog::Warning(ncfFunction)
+                << "numAudioChannels(" << numAudioChannels << ") != audioInfo.channelsPerFrame("
+                << audioInfo.channelsPerFrame << ")";
         }
         auto* const audio_track = dynamic_cast<AudioMediaTrack*>(track.get());
         CHK_PTR(audio_track);
@@ -90,6 +97,5 @@ NCFRESULT QuickTimeSampleMapping::SetWorkingAudioFormat(ncfUInt32 trackNMA, ncfU
         return NCF_OK;
     });
 }
-// clang-format on
 
 }  // namespace NMA::Impl

@@ -23,9 +23,6 @@ constexpr ncfUInt32 kAll = 0xFFFFFFFFu;
 
 }  // namespace
 
-// clang-format off
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-
 // The lock is held through decoding and conversion, so that the pixel format
 // told to the reader still holds when it reads.
 NCFRESULT QuickTimeSampleMapping::ProvideSampleRange(INCFAVBuffer* pAVBuffer, ncfUInt32) {
@@ -50,7 +47,9 @@ NCFRESULT QuickTimeSampleMapping::ProvideSampleRange(INCFAVBuffer* pAVBuffer, nc
 
 // --- pictures ------------------------------------------------------------------------
 
-NCFRESULT QuickTimeSampleMapping::ProvidePicture(MediaTrack& pictureTrack, ncfUInt64 sample, ncfUInt64 numSamples, const NCFSmartPtr<INCFBuffer>& pBuffer) {
+NCFRESULT QuickTimeSampleMapping::ProvidePicture(MediaTrack& pictureTrack, ncfUInt64 sample,
+                                                 ncfUInt64 numSamples,
+                                                 const NCFSmartPtr<INCFBuffer>& pBuffer) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::ProvideSampleRange");
     if (!_videoReaderHolder) {
         return NMA_E_NOTINITIALIZED;
@@ -77,12 +76,15 @@ NCFRESULT QuickTimeSampleMapping::ProvidePicture(MediaTrack& pictureTrack, ncfUI
     const ncfUInt32 nOutputBufSize = OutputFrameSize(*video_format, width, height);
     NCF_RETURN(pBuffer->Allocate(nOutputBufSize, 1));
     void* start = nullptr;
-    NCF_RETURN_TEXT("pBuffer->GetBufferPointer((void**)&pOutputBuffer)", pBuffer->GetBufferPointer(&start));
+    NCF_RETURN_TEXT("pBuffer->GetBufferPointer((void**)&pOutputBuffer)",
+                    pBuffer->GetBufferPointer(&start));
     auto* const pOutputBuffer = static_cast<ncfUInt8*>(start);
     if (nOutputBufSize != 0) {
         CHK_PTR(pOutputBuffer);
     }
-    if (const NCFRESULT rc = ReadPicture(*video_format, sample, width, height, nQuickTimeBufSize, pOutputBuffer, nOutputBufSize); rc != NCF_OK) {
+    if (const NCFRESULT rc = ReadPicture(*video_format, sample, width, height, nQuickTimeBufSize,
+                                         pOutputBuffer, nOutputBufSize);
+        rc != NCF_OK) {
         return rc;
     }
     const ncfUInt32 pixelFormat = video_format->pixelFormat;
@@ -98,11 +100,15 @@ NCFRESULT QuickTimeSampleMapping::ProvidePicture(MediaTrack& pictureTrack, ncfUI
 // frame is larger than the host's buffer must not write past its end: it gets a
 // block of its own, and what fits is copied. The block starts as zeros, so that
 // what a reader left out is nothing, and not what the memory held before.
-NCFRESULT QuickTimeSampleMapping::ReadPicture(const QTImageFormat& format, ncfUInt64 sample, ncfUInt32 width, ncfUInt32 height, ncfUInt32 nQuickTimeBufSize, ncfUInt8* pOutputBuffer, ncfUInt32 nOutputBufSize) {
+NCFRESULT QuickTimeSampleMapping::ReadPicture(const QTImageFormat& format, ncfUInt64 sample,
+                                              ncfUInt32 width, ncfUInt32 height,
+                                              ncfUInt32 nQuickTimeBufSize, ncfUInt8* pOutputBuffer,
+                                              ncfUInt32 nOutputBufSize) {
     const PixelConversion convert = format.qt_params.convert;
     const bool readsAside = convert || nQuickTimeBufSize > nOutputBufSize;
     std::vector<ncfUInt8> scratch(readsAside ? nQuickTimeBufSize : 0);
-    NCFRESULT rc = _videoReaderHolder->ReadFrame(sample, readsAside ? scratch.data() : pOutputBuffer, 0, 0, 0);
+    NCFRESULT rc =
+        _videoReaderHolder->ReadFrame(sample, readsAside ? scratch.data() : pOutputBuffer, 0, 0, 0);
     if (rc != NCF_OK) {
         if (rc == NCF_E_ACCESSDENIED) {
             rc = kPictureAccessDenied;
@@ -123,7 +129,9 @@ NCFRESULT QuickTimeSampleMapping::ReadPicture(const QTImageFormat& format, ncfUI
 
 // Sound that can't be read is silence, and no failure: a player goes on. The
 // whole size counts as valid whatever the reader did.
-NCFRESULT QuickTimeSampleMapping::ProvideSound(ncfUInt32 trackNMA, MediaTrack& soundTrack, ncfUInt64 sample, ncfUInt64 numSamples, const NCFSmartPtr<INCFBuffer>& pBuffer) {
+NCFRESULT QuickTimeSampleMapping::ProvideSound(ncfUInt32 trackNMA, MediaTrack& soundTrack,
+                                               ncfUInt64 sample, ncfUInt64 numSamples,
+                                               const NCFSmartPtr<INCFBuffer>& pBuffer) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::ProvideSampleRange");
     if (!_audioReaderHolder) {
         return NMA_E_NOTINITIALIZED;
@@ -143,19 +151,22 @@ NCFRESULT QuickTimeSampleMapping::ProvideSound(ncfUInt32 trackNMA, MediaTrack& s
     const ncfUInt64 memToAlloc = memNeeded;
     NCF_RETURN(pBuffer->Allocate(memToAlloc, 1));
     void* pWorkingBuffer = nullptr;
-    NCF_RETURN_TEXT("pBuffer->GetBufferPointer((void**)&pWorkingBuffer)", pBuffer->GetBufferPointer(&pWorkingBuffer));
+    NCF_RETURN_TEXT("pBuffer->GetBufferPointer((void**)&pWorkingBuffer)",
+                    pBuffer->GetBufferPointer(&pWorkingBuffer));
     CHK_PTR(pWorkingBuffer);
     ncfUInt32 trackQT = 0;
     NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
     ncfUInt64 count = numSamples;
-    const NCFRESULT rc = _audioReaderHolder->ReadSamples(trackQT, sample, &count, pWorkingBuffer, memNeeded, false, false);
+    const NCFRESULT rc = _audioReaderHolder->ReadSamples(trackQT, sample, &count, pWorkingBuffer,
+                                                         memNeeded, false, false);
     if (rc != NCF_OK) {
-        _pConsole->Write(1, "QuickTime failed to extract audio, filling the buffers with silence!\n");
+        _pConsole->Write(1,
+                         "QuickTime failed to extract audio, filling the buffers with silence!\n");
         std::memset(pWorkingBuffer, 0, memNeeded);
     }
-    NCF_RETURN(pBuffer->SetComplete( kNCFBuffer_Complete, numSamples * numAudioChannels * bytesPerSample, NCF_OK));
+    NCF_RETURN(pBuffer->SetComplete( kNCFBuffer_Complete,
+                                    numSamples * numAudioChannels * bytesPerSample, NCF_OK));
     return NCF_OK;
 }
-// clang-format on
 
 }  // namespace NMA::Impl

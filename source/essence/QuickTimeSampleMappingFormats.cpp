@@ -25,16 +25,11 @@ bool IsPreferred(ncfUInt32 fourCC) {
 // The codec stores Y'CbCr.
 constexpr ncfUInt32 kStorageYCbCr = 0;
 
-// clang-format off
 constexpr QTPixelParams k2vuyParams = {QuickTime::k2vuyPixelFormat, {2, 1}, {2, 1}, nullptr};
 // Shown as ten bits, asked of the reader as '2vuy' with room for twice as much.
 constexpr QTPixelParams kV210Params = {QuickTime::k2vuyPixelFormat, {4, 1}, {4, 1}, nullptr};
-// clang-format on
 
 }  // namespace
-
-// clang-format off
-// Statements are logged as they stand.
 
 NCFRESULT QuickTimeSampleMapping::AddSupportedImageFormatsBasedOnCodec() {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::AddSupportedImageFormatsBasedOnCodec");
@@ -65,7 +60,8 @@ NCFRESULT QuickTimeSampleMapping::AddSupportedImageFormatsBasedOnCodec() {
 
 // A codec that can't tell its formats has none; only a list that can't be read
 // is a failure.
-NCFRESULT QuickTimeSampleMapping::ReadCodecPixelFormats(QuickTime::IQuickTimeProperty* quickTimeProperty) {
+NCFRESULT QuickTimeSampleMapping::ReadCodecPixelFormats(
+    QuickTime::IQuickTimeProperty* quickTimeProperty) {
     ncfUInt32 count = 0;
     NCFSmartPtr<INCFBuffer> pixBuffer;
     if (quickTimeProperty->GetCodecPixelFormats(pixBuffer.outArg(), &count) < 0) {
@@ -73,7 +69,8 @@ NCFRESULT QuickTimeSampleMapping::ReadCodecPixelFormats(QuickTime::IQuickTimePro
     }
     void* codecPixelFormats_ptr = nullptr;
     if (count != 0 && pixBuffer) {
-        if (const NCFRESULT result = pixBuffer->GetBufferPointer(&codecPixelFormats_ptr); result < 0) {
+        if (const NCFRESULT result = pixBuffer->GetBufferPointer(&codecPixelFormats_ptr);
+            result < 0) {
             return result;
         }
     }
@@ -86,19 +83,22 @@ NCFRESULT QuickTimeSampleMapping::ReadCodecPixelFormats(QuickTime::IQuickTimePro
 
 // The level setting is copied here: this is where a change of it reaches the
 // pixels.
-NCFRESULT QuickTimeSampleMapping::AddDecompressorPixelFormats(MediaTrack* video_track, MediaTrack* alpha_track) {
+NCFRESULT QuickTimeSampleMapping::AddDecompressorPixelFormats(MediaTrack* video_track,
+                                                              MediaTrack* alpha_track) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::AddDecompressorPixelFormats");
     CHK_INARG(video_track);
     CHK_PTR(_pConsole);
     levelRemap_ = media_->GetClipParams()->levelRemap;
     if (codecPixelFormats_.empty()) {
-        NCF_RETURN(AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat, _codecSupportsRGB_CCIR));
+        NCF_RETURN(AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat,
+                                  _codecSupportsRGB_CCIR));
     }
     ncfBool isMultiformat = 0;
     NCF_RETURN(media_->IsMultiFormatMovie(&isMultiformat));
     if (isMultiformat) {
         // What one of the codecs likes says nothing about the others.
-        NCF_RETURN(AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat, _codecSupportsRGB_CCIR));
+        NCF_RETURN(AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat,
+                                  _codecSupportsRGB_CCIR));
         return NCF_OK;
     }
     bool added = false;
@@ -109,12 +109,14 @@ NCFRESULT QuickTimeSampleMapping::AddDecompressorPixelFormats(MediaTrack* video_
         added = AddCodecPixelFormats(video_track, alpha_track, false);
     }
     if (!added) {
-        NCF_RETURN(AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat, _codecSupportsRGB_CCIR));
+        NCF_RETURN(AddPixelFormat(video_track, alpha_track, QuickTime::k2vuyPixelFormat,
+                                  _codecSupportsRGB_CCIR));
     }
     return NCF_OK;
 }
 
-bool QuickTimeSampleMapping::AddCodecPixelFormats(MediaTrack* video_track, MediaTrack* alpha_track, bool preferredOnly) {
+bool QuickTimeSampleMapping::AddCodecPixelFormats(MediaTrack* video_track, MediaTrack* alpha_track,
+                                                  bool preferredOnly) {
     bool added = false;
     for (const ncfUInt32 fourCC : codecPixelFormats_) {
         if (preferredOnly && !IsPreferred(fourCC)) {
@@ -127,7 +129,8 @@ bool QuickTimeSampleMapping::AddCodecPixelFormats(MediaTrack* video_track, Media
     return added;
 }
 
-NCFRESULT QuickTimeSampleMapping::AddPixelFormat(MediaTrack* video_track, MediaTrack* alpha_track, ncfUInt32 fourCC, ncfUInt32 supportsRGB_CCIR) {
+NCFRESULT QuickTimeSampleMapping::AddPixelFormat(MediaTrack* video_track, MediaTrack* alpha_track,
+                                                 ncfUInt32 fourCC, ncfUInt32 supportsRGB_CCIR) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::AddPixelFormat");
     CHK_INARG(video_track);
     const bool hasAlpha = media_->ShowsAlpha();
@@ -138,36 +141,48 @@ NCFRESULT QuickTimeSampleMapping::AddPixelFormat(MediaTrack* video_track, MediaT
         }
         if (!levelsAsStored) {
             // The level tables work on RGB.
-            return AddPixelFormat(video_track, alpha_track, QuickTime::kNVZ2PixelFormat, supportsRGB_CCIR);
+            return AddPixelFormat(video_track, alpha_track, QuickTime::kNVZ2PixelFormat,
+                                  supportsRGB_CCIR);
         }
-        return AddYCbCrPixelFormat(video_track, CT_UCHAR, k2vuyParams, "Adding support for '2vuy'.\n");
+        return AddYCbCrPixelFormat(video_track, CT_UCHAR, k2vuyParams,
+                                   "Adding support for '2vuy'.\n");
     }
     if (fourCC == QuickTime::kv210PixelFormat) {
         if (hasAlpha || !levelsAsStored) {
             return NCF_E_FAIL;
         }
-        return AddYCbCrPixelFormat(video_track, CT_V210, kV210Params, "Adding support for 'v210'.\n");
+        return AddYCbCrPixelFormat(video_track, CT_V210, kV210Params,
+                                   "Adding support for 'v210'.\n");
     }
     const RGBRecipe* const recipe = FindRGBRecipe(fourCC, supportsRGB_CCIR != 0);
     if (!recipe) {
         return NCF_E_FAIL;
     }
     const FormatRow& video = recipe->video;
-    NCF_RETURN_TEXT(video.text, AddImagePixelFormat(video_track, video.pixelFormat, video.chromaSubSampling, video.colorSpace, video.componentType, video.componentRange, video.qt_params));
+    NCF_RETURN_TEXT(video.text,
+                    AddImagePixelFormat(video_track, video.pixelFormat, video.chromaSubSampling,
+                                        video.colorSpace, video.componentType, video.componentRange,
+                                        video.qt_params));
     _pConsole->Write(4, "%s", video.line);
     if (!alpha_track || !recipe->alpha) {
         return NCF_OK;
     }
     NCFASSERT(MediaTrack::kVideoAlpha == alpha_track->GetTrackType());
     const FormatRow& alpha = *recipe->alpha;
-    NCF_RETURN_TEXT(alpha.text, AddImagePixelFormat(alpha_track, alpha.pixelFormat, alpha.chromaSubSampling, alpha.colorSpace, alpha.componentType, alpha.componentRange, alpha.qt_params));
+    NCF_RETURN_TEXT(alpha.text,
+                    AddImagePixelFormat(alpha_track, alpha.pixelFormat, alpha.chromaSubSampling,
+                                        alpha.colorSpace, alpha.componentType, alpha.componentRange,
+                                        alpha.qt_params));
     _pConsole->Write(4, "%s", alpha.line);
     return NCF_OK;
 }
 
 // The colour space is the clip's; a clip that has none, or one that this
 // layout can't have, goes by its size.
-NCFRESULT QuickTimeSampleMapping::AddYCbCrPixelFormat(MediaTrack* video_track, ncfUInt32 componentType, const QTPixelParams& qt_params, const char* line) {
+NCFRESULT QuickTimeSampleMapping::AddYCbCrPixelFormat(MediaTrack* video_track,
+                                                      ncfUInt32 componentType,
+                                                      const QTPixelParams& qt_params,
+                                                      const char* line) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::AddPixelFormat");
     ncfUInt32 colorSpaceToUse = CS_UNDEFINED;
     if (const NCFRESULT told = media_->GetColorSpace(&colorSpaceToUse); told != NMA_E_NOTSET) {
@@ -176,14 +191,22 @@ NCFRESULT QuickTimeSampleMapping::AddYCbCrPixelFormat(MediaTrack* video_track, n
     if (colorSpaceToUse == CS_RGB || colorSpaceToUse == CS_UNDEFINED) {
         NCF_RETURN(InferColorSpaceFromStandard(media_, &colorSpaceToUse));
     }
-    NCF_RETURN_TEXT(componentType == CT_V210 ? "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, colorSpaceToUse, CT_V210, CRT_VideoRange, qt_params)"
-                                             : "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, colorSpaceToUse, CT_UCHAR, CRT_VideoRange, qt_params)",
-                    AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, colorSpaceToUse, componentType, CRT_VideoRange, qt_params));
+    NCF_RETURN_TEXT(componentType == CT_V210
+                        ? "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, colorSpaceToUse, "
+                          "CT_V210, CRT_VideoRange, qt_params)"
+                        : "AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, colorSpaceToUse, "
+                          "CT_UCHAR, CRT_VideoRange, qt_params)",
+                    AddImagePixelFormat(video_track, PF_CbYCrY, CSS_4220, colorSpaceToUse,
+                                        componentType, CRT_VideoRange, qt_params));
     _pConsole->Write(4, "%s", line);
     return NCF_OK;
 }
 
-NCFRESULT QuickTimeSampleMapping::AddImagePixelFormat(MediaTrack* track, ncfUInt32 pixelFormat, ncfUInt32 chromaSubSampling, ncfUInt32 colorSpace, ncfUInt32 componentType, ncfUInt32 componentRange, const QTPixelParams& qt_params) {
+NCFRESULT QuickTimeSampleMapping::AddImagePixelFormat(MediaTrack* track, ncfUInt32 pixelFormat,
+                                                      ncfUInt32 chromaSubSampling,
+                                                      ncfUInt32 colorSpace, ncfUInt32 componentType,
+                                                      ncfUInt32 componentRange,
+                                                      const QTPixelParams& qt_params) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::AddImagePixelFormat");
     ncfUInt32 blo = 0;
     ncfUInt32 tfo = 0;
@@ -204,6 +227,5 @@ NCFRESULT QuickTimeSampleMapping::AddImagePixelFormat(MediaTrack* track, ncfUInt
     track->AddFormat(format);
     return NCF_OK;
 }
-// clang-format on
 
 }  // namespace NMA::Impl

@@ -36,12 +36,10 @@ const char* LabelOf(ncfUInt32 fourCC) {
 
 }  // namespace
 
-// clang-format off
-// Statements are logged as they stand.
-
 // --- the list ------------------------------------------------------------------------
 
-NCFRESULT QuickTimeSampleMapping::GetNumberOfImageFormats(ncfUInt32 trackNMA, ncfUInt32* numFormats) {
+NCFRESULT QuickTimeSampleMapping::GetNumberOfImageFormats(ncfUInt32 trackNMA,
+                                                          ncfUInt32* numFormats) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfImageFormats");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numFormats);
@@ -56,7 +54,10 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfImageFormats(ncfUInt32 trackNMA, nc
 }
 
 // A bad track outranks a null pointer here; with sound it is the other way.
-NCFRESULT QuickTimeSampleMapping::GetImageFormat(ncfUInt32 trackNMA, ncfUInt32 formatIndex, ncfUInt32* pixelFormat, ncfUInt32* chromaSubSampling, ncfUInt32* componentFormat, ncfUInt32* componentRangeType, ncfUInt32* colorSpace, ncfUInt32* fieldOrder, ncfUInt32* frameLayout, ncfUInt32* orientation) {
+NCFRESULT QuickTimeSampleMapping::GetImageFormat(
+    ncfUInt32 trackNMA, ncfUInt32 formatIndex, ncfUInt32* pixelFormat, ncfUInt32* chromaSubSampling,
+    ncfUInt32* componentFormat, ncfUInt32* componentRangeType, ncfUInt32* colorSpace,
+    ncfUInt32* fieldOrder, ncfUInt32* frameLayout, ncfUInt32* orientation) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetImageFormat");
     return ResultOf([&]() -> NCFRESULT {
         std::tr1::shared_ptr<MediaTrack> track;
@@ -106,13 +107,15 @@ NCFRESULT QuickTimeSampleMapping::SetWorkingImageFormat(ncfUInt32 trackNMA, ncfU
         NCF_RETURN(track->GetMediaFormat(formatIndex, mediaFormat));
         const auto* const image_format = dynamic_cast<const QTImageFormat*>(mediaFormat.get());
         CHK_PTR(image_format);
-        const auto* const current = dynamic_cast<const QTImageFormat*>(track->GetSelectedFormat().get());
+        const auto* const current =
+            dynamic_cast<const QTImageFormat*>(track->GetSelectedFormat().get());
         if (current && *current == *image_format) {
             return NCF_OK;
         }
         track->SetSelectedFormat(mediaFormat);
         track->SetSelectedIndex(formatIndex);
-        _pConsole->Write(4, "Player negotiated for QuickTime format: %s \n", LabelOf(image_format->qt_params.fourCC));
+        _pConsole->Write(4, "Player negotiated for QuickTime format: %s \n",
+                         LabelOf(image_format->qt_params.fourCC));
         return RestartVideoReader(*track);
     });
 }
@@ -144,7 +147,8 @@ NCFRESULT QuickTimeSampleMapping::RestartVideoReader(const MediaTrack& selectedT
 
 // --- sizes ----------------------------------------------------------------------------------
 
-void QuickTimeSampleMapping::GetAlignedWidth(ncfUInt32 componentType, ncfUInt32 width, ncfUInt32* alignedWidth) {
+void QuickTimeSampleMapping::GetAlignedWidth(ncfUInt32 componentType, ncfUInt32 width,
+                                             ncfUInt32* alignedWidth) {
     if (!alignedWidth) {
         return;
     }
@@ -152,16 +156,19 @@ void QuickTimeSampleMapping::GetAlignedWidth(ncfUInt32 componentType, ncfUInt32 
     *alignedWidth = componentType == CT_V210 ? RoundUp(width, kV210Group) : width;
 }
 
-ncfUInt32 QuickTimeSampleMapping::OutputFrameSize(const QTImageFormat& format, ncfUInt32 width, ncfUInt32 height) {
+ncfUInt32 QuickTimeSampleMapping::OutputFrameSize(const QTImageFormat& format, ncfUInt32 width,
+                                                  ncfUInt32 height) {
     ncfUInt32 alignedWidth = 0;
     GetAlignedWidth(format.componentFormat, width, &alignedWidth);
     const Rational& bytes = format.qt_params.outputBytesPerPixel;
-    return alignedWidth * height * static_cast<ncfUInt32>(bytes.numerator) / static_cast<ncfUInt32>(bytes.denominator);
+    return alignedWidth * height * static_cast<ncfUInt32>(bytes.numerator) /
+           static_cast<ncfUInt32>(bytes.denominator);
 }
 
 // The height is that of one field where there are two; the buffer below is
 // always that of a frame.
-NCFRESULT QuickTimeSampleMapping::GetWorkingImageSize(ncfUInt32, ncfUInt32* width, ncfUInt32* height) {
+NCFRESULT QuickTimeSampleMapping::GetWorkingImageSize(ncfUInt32, ncfUInt32* width,
+                                                      ncfUInt32* height) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetWorkingImageSize");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(width);
@@ -188,7 +195,9 @@ NCFRESULT QuickTimeSampleMapping::GetWorkingImageSize(ncfUInt32, ncfUInt32* widt
     });
 }
 
-NCFRESULT QuickTimeSampleMapping::GetWorkingImageBufferRequirements(ncfUInt32 trackNMA, ncfUInt16* bufferStartAlignment, ncfUInt64* maxBufferSize) {
+NCFRESULT QuickTimeSampleMapping::GetWorkingImageBufferRequirements(ncfUInt32 trackNMA,
+                                                                    ncfUInt16* bufferStartAlignment,
+                                                                    ncfUInt64* maxBufferSize) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetWorkingImageBufferRequirements");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(bufferStartAlignment);
@@ -211,6 +220,5 @@ NCFRESULT QuickTimeSampleMapping::GetWorkingImageBufferRequirements(ncfUInt32 tr
         return NCF_OK;
     });
 }
-// clang-format on
 
 }  // namespace NMA::Impl

@@ -51,9 +51,6 @@ bool IsBelow(ncfUInt64 left, ncfUInt64 right) {
 
 }  // namespace
 
-// clang-format off
-// These texts are part of the log's format; where the code differs, _TEXT carries them.
-
 // --- tracks ------------------------------------------------------------------------
 
 // The count is the answer itself; a failure is told from it by its sign.
@@ -85,8 +82,11 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfChannels(ncfUInt32 trackNMA, ncfUIn
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
         NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper;
         NCF_RETURN(media_->GetQuickTimeInterface(qtWrapper));
-        NCF_RETURN_TEXT("qtWrapper->GetAudioInfoForTrack(trackQT, numChannels, NULL, NULL, NULL, NULL, NULL, NULL, NULL, NULL)",
-                        qtWrapper->GetAudioInfoForTrack(trackQT, numChannels, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr));
+        NCF_RETURN_TEXT(
+            "qtWrapper->GetAudioInfoForTrack(trackQT, numChannels, NULL, NULL, NULL, NULL, NULL, "
+            "NULL, NULL, NULL)",
+            qtWrapper->GetAudioInfoForTrack(trackQT, numChannels, nullptr, nullptr, nullptr,
+                                            nullptr, nullptr, nullptr, nullptr, nullptr));
         return NCF_OK;
     });
 }
@@ -105,21 +105,24 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfSamples(ncfUInt32 trackNMA, ncfUInt
 }
 
 // A size has 32 bits; the rest of the caller's variable stays as it is.
-NCFRESULT QuickTimeSampleMapping::GetSampleSize(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* sizeInBytesPtr) {
+NCFRESULT QuickTimeSampleMapping::GetSampleSize(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                ncfUInt64* sizeInBytesPtr) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSampleSize");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(sizeInBytesPtr);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
         ncfUInt32 size = 0;
-        NCF_RETURN_TEXT("media_->GetDataSizePerSample(trackQT, (long)sample + 1, (ncfUInt32*)sizeInBytesPtr)",
-                        media_->GetDataSizePerSample(trackQT, NarrowedPlusOne(sample), &size));
+        NCF_RETURN_TEXT(
+            "media_->GetDataSizePerSample(trackQT, (long)sample + 1, (ncfUInt32*)sizeInBytesPtr)",
+            media_->GetDataSizePerSample(trackQT, NarrowedPlusOne(sample), &size));
         std::memcpy(sizeInBytesPtr, &size, sizeof size);
         return NCF_OK;
     });
 }
 
-NCFRESULT QuickTimeSampleMapping::GetSamplePosition(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* positionInBytes) {
+NCFRESULT QuickTimeSampleMapping::GetSamplePosition(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                    ncfUInt64* positionInBytes) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSamplePosition");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(positionInBytes);
@@ -132,7 +135,9 @@ NCFRESULT QuickTimeSampleMapping::GetSamplePosition(ncfUInt32 trackNMA, ncfUInt6
     });
 }
 
-NCFRESULT QuickTimeSampleMapping::GetSampleProperties(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* flagsPtr, ncfUInt32* numDependenciesPtr) {
+NCFRESULT QuickTimeSampleMapping::GetSampleProperties(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                      ncfUInt64* flagsPtr,
+                                                      ncfUInt32* numDependenciesPtr) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSampleProperties");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(flagsPtr);
@@ -157,7 +162,8 @@ NCFRESULT QuickTimeSampleMapping::GetSampleProperties(ncfUInt32 trackNMA, ncfUIn
 
 // The clip names the sample behind the run, counted from one. A sample that is
 // its own end gives -1, with success.
-NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousSamples(ncfUInt32 trackNMA, ncfUInt64 sample, ncfSInt64* numSamples) {
+NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousSamples(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                               ncfSInt64* numSamples) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfContiguousSamples");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numSamples);
@@ -171,7 +177,8 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousSamples(ncfUInt32 trackNM
         }
         // A track without such a table has runs of one.
         ncfUInt64 lastSample = 0;
-        const NCFRESULT found = media_->GetNextDiscontiguousDataAttributeChange(trackQT, sample + 1, &lastSample);
+        const NCFRESULT found =
+            media_->GetNextDiscontiguousDataAttributeChange(trackQT, sample + 1, &lastSample);
         *numSamples = found == NCF_OK ? static_cast<ncfSInt64>(lastSample - 1 - sample) : 1;
         if (!IsBelow(lastSample, sample)) {
             return NCF_OK;
@@ -184,14 +191,16 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousSamples(ncfUInt32 trackNM
     });
 }
 
-NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousBytes(ncfUInt32 trackNMA, ncfUInt64 sample, ncfUInt64* numBytes) {
+NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousBytes(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                             ncfUInt64* numBytes) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetNumberOfContiguousBytes");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(numBytes);
         ncfUInt32 trackQT = 0;
         NCF_RETURN(AAFTrackToQuickTimeTrack(trackNMA, &trackQT));
         ncfUInt64 lastSample = 0;
-        NCF_RETURN(media_->GetNextDiscontiguousDataAttributeChange(trackQT, sample + 1, &lastSample));
+        NCF_RETURN(
+            media_->GetNextDiscontiguousDataAttributeChange(trackQT, sample + 1, &lastSample));
         if (IsBelow(lastSample, sample)) {
             if (lastSample != 0) {
                 return NCF_E_UNEXPECTED;
@@ -204,8 +213,9 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousBytes(ncfUInt32 trackNMA,
         ncfUInt64 lastPosition = 0;
         NCF_RETURN(media_->GetDataOffset(trackQT, lastSample - 1, &lastPosition));
         ncfUInt32 lastSize = 0;
-        NCF_RETURN_TEXT("media_->GetDataSizePerSample(trackQT, (long)lastSample-1, &lastSize)",
-                        media_->GetDataSizePerSample(trackQT, NarrowedMinusOne(lastSample), &lastSize));
+        NCF_RETURN_TEXT(
+            "media_->GetDataSizePerSample(trackQT, (long)lastSample-1, &lastSize)",
+            media_->GetDataSizePerSample(trackQT, NarrowedMinusOne(lastSample), &lastSize));
         *numBytes = lastPosition - startPosition + lastSize;
         return NCF_OK;
     });
@@ -213,27 +223,29 @@ NCFRESULT QuickTimeSampleMapping::GetNumberOfContiguousBytes(ncfUInt32 trackNMA,
 
 // --- encoded units: one sample each -------------------------------------------------------
 
-NCFRESULT QuickTimeSampleMapping::GetEncodedUnitSizeInSamples(ncfUInt32, ncfUInt64, ncfUInt64* sizeInSamples) {
+NCFRESULT QuickTimeSampleMapping::GetEncodedUnitSizeInSamples(ncfUInt32, ncfUInt64,
+                                                              ncfUInt64* sizeInSamples) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetEncodedUnitSizeInSamples");
     CHK_INARG(sizeInSamples);
     *sizeInSamples = 1;
     return NCF_OK;
 }
 
-NCFRESULT QuickTimeSampleMapping::GetEncodedUnitFirstSample(ncfUInt32, ncfUInt64 unit, ncfUInt64* sample) {
+NCFRESULT QuickTimeSampleMapping::GetEncodedUnitFirstSample(ncfUInt32, ncfUInt64 unit,
+                                                            ncfUInt64* sample) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetEncodedUnitFirstSample");
     CHK_INARG(sample);
     *sample = unit;
     return NCF_OK;
 }
 
-NCFRESULT QuickTimeSampleMapping::GetEncodedUnitContainingSample(ncfUInt32, ncfUInt64 sample, ncfUInt64* unit) {
+NCFRESULT QuickTimeSampleMapping::GetEncodedUnitContainingSample(ncfUInt32, ncfUInt64 sample,
+                                                                 ncfUInt64* unit) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetEncodedUnitContainingSample");
     CHK_INARG(unit);
     *unit = sample;
     return NCF_OK;
 }
-// clang-format on
 
 // These go through the interface, so that a class which changes the sample
 // operations changes them as well.

@@ -27,8 +27,8 @@ ncfSInt64 Low32(ncfSInt64 value) {
 
 }  // namespace
 
-// clang-format off
-NCFRESULT QuickTimeSampleMapping::GetSampleTemporalOffset(ncfUInt32 trackNMA, ncfUInt64 sample, ncfSInt64* offsetInSamples) {
+NCFRESULT QuickTimeSampleMapping::GetSampleTemporalOffset(ncfUInt32 trackNMA, ncfUInt64 sample,
+                                                          ncfSInt64* offsetInSamples) {
     NCF_FUNCTION("NMA::Impl::QuickTimeSampleMapping::GetSampleTemporalOffset");
     return ResultOf([&]() -> NCFRESULT {
         CHK_INARG(offsetInSamples);
@@ -59,8 +59,9 @@ NCFRESULT QuickTimeSampleMapping::GetSampleTemporalOffset(ncfUInt32 trackNMA, nc
             const auto distance = static_cast<ncfUInt64>(curPos);
             if (sample + distance + 1 <= numSamples) {
                 qtOffset = 0;
-                NCF_RETURN_TEXT("media_->GetDisplayOffset(trackQT, sample + 1 + curPos, &qtOffset)",
-                                media_->GetDisplayOffset(trackQT, sample + 1 + distance, &qtOffset));
+                NCF_RETURN_TEXT(
+                    "media_->GetDisplayOffset(trackQT, sample + 1 + curPos, &qtOffset)",
+                    media_->GetDisplayOffset(trackQT, sample + 1 + distance, &qtOffset));
                 if (decodeDuration == 0) {
                     return NCF_E_FAIL;
                 }
@@ -73,8 +74,9 @@ NCFRESULT QuickTimeSampleMapping::GetSampleTemporalOffset(ncfUInt32 trackNMA, nc
             }
             if (sample + 1 - distance >= 1) {
                 qtOffset = 0;
-                NCF_RETURN_TEXT("media_->GetDisplayOffset(trackQT, sample + 1 - curPos, &qtOffset)",
-                                media_->GetDisplayOffset(trackQT, sample + 1 - distance, &qtOffset));
+                NCF_RETURN_TEXT(
+                    "media_->GetDisplayOffset(trackQT, sample + 1 - curPos, &qtOffset)",
+                    media_->GetDisplayOffset(trackQT, sample + 1 - distance, &qtOffset));
                 if (decodeDuration == 0) {
                     return NCF_E_FAIL;
                 }
@@ -92,6 +94,5 @@ NCFRESULT QuickTimeSampleMapping::GetSampleTemporalOffset(ncfUInt32 trackNMA, nc
         return NCF_E_FAIL;
     });
 }
-// clang-format on
 
 }  // namespace NMA::Impl

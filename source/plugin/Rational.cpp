@@ -64,3 +64,7 @@ ncfUInt64 TruncateToUInt64(double value) {
     }
     return static_cast<ncfUInt64>(value);
 }
+
+double UnitsIn(double duration, double timescale, double rate) {
+    return duration / timescale * rate;
+}

@@ -30,3 +30,7 @@ inline bool operator!=(const Rational& left, const Rational& right) {
 // The whole part of a number, for lengths that were worked out in doubles: 0
 // for what is not a number, negative, or too large for 64 bits.
 ncfUInt64 TruncateToUInt64(double value);
+
+// How many units at `rate` per second fill a duration. The seconds are rounded to a
+// double before they are multiplied, so 696/600 of a second at 25 is a little below 29.
+double UnitsIn(double duration, double timescale, double rate);

@@ -8,6 +8,10 @@
 // the name that NCF_FUNCTION gave the enclosing function, and leaves the
 // function with a code. None throws.
 //
+// The text is part of the log's format, spaces included: clang-format leaves the
+// argument as it is written. A line break is logged as one space, so break a long
+// argument only where a space stands.
+//
 // Where the text that is logged is not the statement that compiles, the _TEXT
 // form takes the text beside the expression.
 

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/util/text/HostText.h"
 
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace host::text {
 
@@ -28,21 +28,21 @@ std::u32string Read(INCFString* string) {
     switch (string->GetEncoding()) {
         case kNCFASCII:
         case kNCFUTF8:
-            return ReadRaw(string, &INCFString::GetRawUTF8, FromUtf8);
+            return ReadRaw(string, &INCFString::GetRawUTF8, encodings::FromUtf8);
         case kNCFUTF16:
-            return ReadRaw(string, &INCFString::GetRawUTF16, FromUtf16);
+            return ReadRaw(string, &INCFString::GetRawUTF16, encodings::FromUtf16);
         case kNCFUTF32:
             return ReadRaw(string, &INCFString::GetRawUTF32,
                            [](std::u32string_view units) { return std::u32string(units); });
         case kNCFWCHAR:
-            return ReadRaw(string, &INCFString::GetRawWCHAR, FromWide);
+            return ReadRaw(string, &INCFString::GetRawWCHAR, encodings::FromWide);
         default:
             return {};
     }
 }
 
 std::string ReadUtf8(INCFString* string) {
-    return ToUtf8Lossy(Read(string));
+    return encodings::ToUtf8Lossy(Read(string));
 }
 
 NCFRESULT Assign(INCFString* string, std::u32string_view text, ncfUInt32 keepAs) {
@@ -50,7 +50,7 @@ NCFRESULT Assign(INCFString* string, std::u32string_view text, ncfUInt32 keepAs)
         return NCF_E_POINTER;
     }
     std::u16string units;
-    if (!ToUtf16(text, units)) {
+    if (!encodings::ToUtf16(text, units)) {
         return NCF_E_FAIL;
     }
     return string->AssignUTF16(keepAs, units.data(), static_cast<ncfUInt32>(units.size()));

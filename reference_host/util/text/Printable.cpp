@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/util/text/Printable.h"
 
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 namespace host::text {
 
@@ -34,7 +34,7 @@ void AppendEscaped(char32_t c, std::string& out) {
         default:
             break;
     }
-    for (const char byte : ToUtf8Lossy(std::u32string_view(&c, 1))) {
+    for (const char byte : encodings::ToUtf8Lossy(std::u32string_view(&c, 1))) {
         const auto value = static_cast<unsigned char>(byte);
         out += {'\\', 'x', kDigits[value >> 4], kDigits[value & 15]};
     }
@@ -56,12 +56,12 @@ namespace {
 std::string Escaped(std::string_view utf8, bool keepsLineEnds) {
     std::string out;
     out.reserve(utf8.size());
-    for (const char32_t c : FromUtf8(utf8)) {
+    for (const char32_t c : encodings::FromUtf8(utf8)) {
         const bool isKept = keepsLineEnds && c == U'\n';
-        if (!isKept && (IsControl(c) || IsSurrogate(c))) {
+        if (!isKept && (IsControl(c) || encodings::IsSurrogate(c))) {
             AppendEscaped(c, out);
         } else {
-            out += ToUtf8Lossy(std::u32string_view(&c, 1));
+            out += encodings::ToUtf8Lossy(std::u32string_view(&c, 1));
         }
     }
     return out;

@@ -3,14 +3,14 @@
 #pragma once
 
 #include "host_interfaces/parameters/DocumentWords.h"
-#include "source/parameters/model/NMAParamInfoParam.h"
+#include "source/parameters/model/NMAParamInfoList.h"
 #include "source/parameters/model/ParamItems.h"
 
 namespace NMA::XMLUtils {
 
 // A named group of parameter descriptions and of further groups. Its searches
 // stay on its own level.
-class NMAParamInfoGroup : public NMAParamElement {
+class NMAParamInfoGroup : public NMAParamInfoList<NMAParamInfoGroup> {
 public:
     NCFRESULT GetID(GUID& out) const {
         out = GetParamId(Element());
@@ -39,36 +39,6 @@ public:
     }
     NCFRESULT SetDescription(const NMAString& text) {
         SetParamText(Element(), kParamDescription, text);
-        return NCF_OK;
-    }
-
-    ncfUInt32 GetParameterCount() const { return CountParamItems(Element(), kParamItem); }
-    NCFRESULT GetParameterAt(ncfUInt32 index, NMAParamInfoParam& out) const {
-        return FillParam(out, GetParamItemAt(Element(), kParamItem, index));
-    }
-    NCFRESULT GetParameter(const GUID& id, NMAParamInfoParam& out) const {
-        return FillParam(out, GetParamItem(Element(), kParamItem, ParamIdKey(id)));
-    }
-    NCFRESULT AddParameter(const GUID& id, NMAParamInfoParam& out) {
-        return FillParam(out, AddParamItem(Element(), kParamItem, ParamIdKey(id)));
-    }
-    NCFRESULT RemoveParameter(const GUID& id) {
-        RemoveParamItem(Element(), kParamItem, ParamIdKey(id));
-        return NCF_OK;
-    }
-
-    ncfUInt32 GetGroupCount() const { return CountParamItems(Element(), kParamGroupItem); }
-    NCFRESULT GetGroupAt(ncfUInt32 index, NMAParamInfoGroup& out) const {
-        return FillParam(out, GetParamItemAt(Element(), kParamGroupItem, index));
-    }
-    NCFRESULT GetGroup(const GUID& id, NMAParamInfoGroup& out) const {
-        return FillParam(out, GetParamItem(Element(), kParamGroupItem, ParamIdKey(id)));
-    }
-    NCFRESULT AddGroup(const GUID& id, NMAParamInfoGroup& out) {
-        return FillParam(out, AddParamItem(Element(), kParamGroupItem, ParamIdKey(id)));
-    }
-    NCFRESULT RemoveGroup(const GUID& id) {
-        RemoveParamItem(Element(), kParamGroupItem, ParamIdKey(id));
         return NCF_OK;
     }
 };

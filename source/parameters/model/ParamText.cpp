@@ -9,14 +9,12 @@
 #include <limits>
 #include <string>
 
+#include "host_interfaces/parameters/DocumentWords.h"
 #include "source/plugin/GuidText.h"
 #include "source/plugin/ResultChecks.h"
 
 namespace NMA::XMLUtils::ParamText {
 namespace {
-
-constexpr char kTrue[] = "true";
-constexpr char kFalse[] = "false";
 
 // Requires: `at` is zero-terminated. Moves `at` behind the number.
 ncfUInt64 TakeSigned(const char*& at) {
@@ -133,7 +131,7 @@ void Read(const NMAString& text, GUID& out) {
 }
 
 bool IsTrue(const NMAString& text) {
-    return std::strcmp(text.GetUTF8String(), kTrue) == 0;
+    return std::strcmp(text.GetUTF8String(), kParamTrue) == 0;
 }
 
 // Six places behind a point, whatever the locale of the process.
@@ -156,7 +154,7 @@ NMAString Write(const GUID& value) {
 }
 
 NMAString WriteFlag(bool value) {
-    return NMAString(value ? kTrue : kFalse);
+    return NMAString(value ? kParamTrue : kParamFalse);
 }
 
 }  // namespace NMA::XMLUtils::ParamText

@@ -41,28 +41,27 @@ struct Row : ComponentRow {
 
 // The index of a row is the argument of NCFRegisterComponent. A further component is
 // one row and its class.
-// clang-format off
 inline constexpr ComponentRow kComponents[] = {
     Row<NMA::Impl::QuickTimeMediaVolume>{"QuickTimeMediaVolume", NMA::CompID_QuickTimeMediaVolume,
-        ncfGuid("2C839849-53E5-428A-8669-ED79FE70299B"), 1, 3, 3},
+                                         ncfGuid("2C839849-53E5-428A-8669-ED79FE70299B"), 1, 3, 3},
     Row<NMA::Impl::QuickTimeMediaFormat>{"QuickTimeMediaFormat", NMA::CompID_QuickTimeMediaFormat,
-        ncfGuid("BF41FAED-6DE6-440C-80CA-2FAF8AA5BD5C"), 1, 3, 4},
+                                         ncfGuid("BF41FAED-6DE6-440C-80CA-2FAF8AA5BD5C"), 1, 3, 4},
     Row<NMA::Impl::QuickTimeMasterClips>{"QuickTimeMasterClips", NMA::CompID_QuickTimeMasterClips,
-        ncfGuid("E08DA5CC-5C36-45D6-86F2-F0379C56C755"), 1, 3, 5},
+                                         ncfGuid("E08DA5CC-5C36-45D6-86F2-F0379C56C755"), 1, 3, 5},
     Row<NMA::Impl::QuickTimeVolumeInfo>{"QuickTimeVolumeInfo", NMA::CompID_QuickTimeVolumeInfo,
-        ncfGuid("B7D3689E-DC96-41F2-AC77-DCC8990AA9D5"), 1, 1, 6},
+                                        ncfGuid("B7D3689E-DC96-41F2-AC77-DCC8990AA9D5"), 1, 1, 6},
     Row<NMA::Impl::QuickTimeContainer>{"QuickTimeMediaContainer", NMA::CompID_QuickTimeContainer,
-        ncfGuid("058B2AEF-CC2F-4652-B8A0-28D773A8DFB1"), 1, 3, 1},
-    Row<NMA::Impl::QuickTimeSampleMapping>{"QuickTimeSampleMapping", NMA::CompID_QuickTimeSampleMapping,
+                                       ncfGuid("058B2AEF-CC2F-4652-B8A0-28D773A8DFB1"), 1, 3, 1},
+    Row<NMA::Impl::QuickTimeSampleMapping>{
+        "QuickTimeSampleMapping", NMA::CompID_QuickTimeSampleMapping,
         ncfGuid("109B6222-FDAE-42AB-9E1C-A547123901A0"), 1, 3, 2},
     Row<void>{"QuickTimeClips", NMA::CompID_QuickTimeClips,
-        ncfGuid("C5D1D369-62EF-46F8-84B8-1700F1153100"), 1, 3, 0},
+              ncfGuid("C5D1D369-62EF-46F8-84B8-1700F1153100"), 1, 3, 0},
     Row<NMA::Impl::GenericDocHandler>{"GenericDocumentHandler", kCLSID_GenericDocHandler,
-        ncfGuid("A235C6D4-35F8-4A18-8CD1-7E96A8EBF842"), 1, 3, 7},
+                                      ncfGuid("A235C6D4-35F8-4A18-8CD1-7E96A8EBF842"), 1, 3, 7},
     Row<NMA::Impl::QTParameters>{"QTParameters", NMA::CompID_QTParameters,
-        ncfGuid("5ECB2244-6B8F-41FD-9E36-71EAE5501230"), 1, 3, 8},
+                                 ncfGuid("5ECB2244-6B8F-41FD-9E36-71EAE5501230"), 1, 3, 8},
 };
-// clang-format on
 inline constexpr ncfUInt32 kComponentCount = std::size(kComponents);
 
 // The creation function for a class id, null when no factory serves it.

@@ -20,8 +20,6 @@ class FakeConsole : public FakeObject<INCFConsole> {
 public:
     explicit FakeConsole(Journal* journal = nullptr) : journal_(journal) {}
 
-    NCFRESULT ReservedConsoleOperationA() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedConsoleOperationB() override { return NCF_E_NOTIMPL; }
     NCFRESULT Write(ncfUInt32 level, const char* format, ...) override NCF_PRINTF(3, 4);
 
     struct Line {

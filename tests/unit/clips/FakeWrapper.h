@@ -23,12 +23,10 @@ public:
     }
     ncfUInt32 GetFrameBufferSize(ncfUInt32, ncfUInt64, ncfUInt32) override { return 0; }
     NCFRESULT InitQT(ncfUInt32) override { return NCF_OK; }
-    NCFRESULT ReservedVideoReaderOperation() override { return NCF_E_NOTIMPL; }
     NCFRESULT ReleaseQT() override { return NCF_OK; }
 };
 class FakeAudioReader : public FakeObject<QTWrapper::IQTAudioReader> {
 public:
-    NCFRESULT ReservedAudioReaderOperation() override { return NCF_E_NOTIMPL; }
     NCFRESULT SetParams(ncfUInt32, ncfUInt32, ncfUInt8, double, ncfUInt32&) override {
         return NCF_OK;
     }

@@ -171,16 +171,6 @@ TEST_F(OtherClipTiming, CountsTheSamplesOfASoundTrack) {
     EXPECT_EQ(wrapper->lastTrack, 2u);
 }
 
-// 23/600 of a second is 1690.5 samples, but the seconds are rounded first.
-TEST_F(OtherClipTiming, DividesBeforeItMultipliesForTheSamplesOfASoundTrack) {
-    LoadUsual();
-    wrapper->sampleRate = 44100.0;
-    wrapper->movieTimeScale = 600;
-    wrapper->trackDuration = 23;
-    EXPECT_EQ(other->CalculateAudioTrackLengthInSamples(2, &length), NCF_OK);
-    EXPECT_EQ(length, 1690u);
-}
-
 TEST_F(OtherClipTiming, CountsNoSamplesWithoutATimeScale) {
     LoadUsual();
     wrapper->movieTimeScale = 0;

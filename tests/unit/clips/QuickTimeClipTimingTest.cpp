@@ -189,24 +189,6 @@ TEST_F(QuickTimeClipTiming, RoundsTheLengthOfAPictureTrack) {
     EXPECT_TRUE(log->once("QuickTimeClip::SetAVMovieLengthtrack is not linear!"));
 }
 
-// 348/600 of a second is 14.5 frames, but the seconds are rounded first.
-TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfAPictureTrack) {
-    LoadPictures();
-    Video().linear = 1;
-    Video().trackTimescale = 600;
-    Video().trackDuration = 348;
-    EXPECT_EQ(LengthOf(), 14u);
-}
-
-// 696/600 of a second is 29 frames, but the seconds are rounded first.
-TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheLengthOfSoundOnly) {
-    LoadSound();
-    RateOf(Settings(25.0));
-    parser->duration = 696;
-    parser->timeScale = 600;
-    EXPECT_EQ(LengthOf(), 28u);
-}
-
 TEST_F(QuickTimeClipTiming, CutsTheLengthOfSoundOnly) {
     LoadSound();
     RateOf(Settings(25.0));
@@ -318,22 +300,6 @@ TEST_F(QuickTimeClipTiming, CountsTheSamplesOfASoundTrack) {
     EXPECT_EQ(samples, 1090u);  // 1089.5
     EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(99, &samples), NCF_E_NOTFOUND);
     EXPECT_EQ(samples, 0u);
-}
-
-// 23/600 of a second is 1690.5 samples, but the seconds are rounded first.
-TEST_F(QuickTimeClipTiming, DividesBeforeItMultipliesForTheSamplesOfASoundTrack) {
-    FakeAudioTrack& track = LoadSound();
-    track.description->rate = 44100.0;
-    track.trackDuration = 23;
-    parser->timeScale = 600;
-    ncfUInt64 samples = 0;
-    EXPECT_EQ(clip->CalculateAudioTrackLengthInSamples(2, &samples), NCF_OK);
-    EXPECT_EQ(samples, 1690u);
-    track.mediaDuration = 23;
-    track.mediaTimescale = 600;
-    samples = 0;
-    EXPECT_EQ(clip->CalculateMediaOnTrackLengthInSamples(2, &samples), NCF_OK);
-    EXPECT_EQ(samples, 1690u);
 }
 
 TEST_F(QuickTimeClipTiming, ReachesBeyondTheSignedRangeInSamples) {

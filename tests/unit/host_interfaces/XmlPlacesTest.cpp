@@ -10,7 +10,6 @@
 
 namespace {
 
-// clang-format off
 const SlotRow kSlots[] = {
     {"INCFSaxDocumentHandler::Start", 3, SlotOf(&UTIL::INCFSaxDocumentHandler::Start)},
     {"INCFSaxDocumentHandler::End", 4, SlotOf(&UTIL::INCFSaxDocumentHandler::End)},
@@ -46,7 +45,6 @@ const SlotRow kSlots[] = {
     {"IXmlWriter::Element", 7, SlotOf(&IXmlWriter::Element)},
     {"IXmlWriter::Text", 8, SlotOf(&IXmlWriter::Text)},
 };
-// clang-format on
 
 TEST(XmlInterfaces, HaveTheirOperationsInTheirPlaces) {
     ExpectPublishedPlaces(kSlots);

@@ -108,3 +108,13 @@ TEST(TruncateToUInt64, ReachesBeyondTheSignedRange) {
     EXPECT_EQ(TruncateToUInt64(std::ldexp(1.0, 63) + 4096.0), (ncfUInt64{1} << 63) + 4096);
     EXPECT_EQ(TruncateToUInt64(std::ldexp(1.0, 62)), ncfUInt64{1} << 62);
 }
+
+TEST(UnitsIn, RoundsTheSecondsFirst) {
+    const struct {
+        double duration, rate, exact;
+    } rows[] = {{348, 25.0, 14.5}, {696, 25.0, 29.0}, {23, 44100.0, 1690.5}};
+    for (const auto& row : rows) {
+        EXPECT_LT(UnitsIn(row.duration, 600, row.rate), row.exact);
+        EXPECT_DOUBLE_EQ(UnitsIn(row.duration, 600, row.rate), row.exact);
+    }
+}

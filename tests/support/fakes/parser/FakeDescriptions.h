@@ -127,7 +127,6 @@ public:
     NCFRESULT GetDataFormat(ncfUInt32* out) override {
         return give("GetDataFormat", out, dataFormat);
     }
-    NCFRESULT ReservedVideoDescription4() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetEncodedWidthAndHeight(ncfUInt16* w, ncfUInt16* h) override {
         const NCFRESULT result = give("GetEncodedWidthAndHeight", w, width);
         if (result >= 0) {
@@ -135,12 +134,7 @@ public:
         }
         return result;
     }
-    NCFRESULT ReservedVideoDescription6() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription7() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription8() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription9() override { return NCF_E_NOTIMPL; }
     NCFRESULT HasAlpha(ncfSInt32* out) override { return give("HasAlpha", out, hasAlpha); }
-    NCFRESULT ReservedVideoDescription11() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetFieldInfo(ncfUInt32* count, ncfUInt32* top, ncfUInt32* apart) override {
         const NCFRESULT result = give("GetFieldInfo", count, fieldCount);
         if (result >= 0 && top) {
@@ -151,11 +145,6 @@ public:
         }
         return result;
     }
-    NCFRESULT ReservedVideoDescription13() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription14() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription15() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription16() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription17() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetVendor(ncfUInt32* out) override { return give("GetVendor", out, vendor); }
     NCFRESULT GetImageAspectRatio(ncfUInt32* numerator, ncfUInt32* denominator) override {
         const NCFRESULT result = give("GetImageAspectRatio", numerator, aspectNumerator);
@@ -173,9 +162,6 @@ public:
         }
         return result;
     }
-    NCFRESULT ReservedVideoDescription21() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription22() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription23() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetNivoAlphaCodingCount(ncfUInt32* count) override {
         return give("GetNivoAlphaCodingCount", count, alphaCodings.size());
     }
@@ -189,8 +175,6 @@ public:
         }
         return result;
     }
-    NCFRESULT ReservedVideoDescription27() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedVideoDescription28() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetRIAttributes(INCFString** text) override {
         return giveText("GetRIAttributes", text, rasterText);
     }
@@ -222,8 +206,6 @@ public:
     ncfUInt32 bytesPerPacket = 4;
     ncfBool littleEndian = 1;
 
-    NCFRESULT ReservedAudioDescription3() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedAudioDescription4() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetChannelsPerFrame(ncfUInt32* out) override {
         return give("GetChannelsPerFrame", out, channels);
     }

@@ -107,14 +107,10 @@ public:
     NCFRESULT GetCreationTime(ncfUInt64* out) override {
         return give("GetCreationTime", out, creationTime);
     }
-    NCFRESULT ReservedParser4() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetTimeScale(ncfUInt32* out) override { return give("GetTimeScale", out, timeScale); }
     NCFRESULT GetMovieDuration(ncfUInt32* out) override {
         return give("GetMovieDuration", out, duration);
     }
-    NCFRESULT ReservedParser7() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedParser8() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedParser9() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetVideoTrackCount(ncfUInt32* out) override {
         return give("GetVideoTrackCount", out, videoTracks.size());
     }

@@ -32,11 +32,6 @@ public:
         *out = nullptr;
         return refusal->second;
     }
-    NCFRESULT ReservedTrack3() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack4() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack5() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack6() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack7() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetTrackId(ncfUInt32* out) override { return give("GetTrackId", out, id); }
     NCFRESULT GetTrackDuration(ncfUInt32* out) override {
         return give("GetTrackDuration", out, trackDuration);
@@ -58,8 +53,6 @@ public:
     NCFRESULT TrackTimeToMediaTime(ncfUInt64, ncfSInt64* out) override {
         return give("TrackTimeToMediaTime", out, mediaOffset);
     }
-    NCFRESULT ReservedTrack12() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack13() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetMediaTS(ncfUInt32* out) override {
         return give("GetMediaTS", out, mediaTimescale);
     }
@@ -72,10 +65,6 @@ public:
     NCFRESULT GetSampleDescriptionCount(ncfUInt32* out) override {
         return give("GetSampleDescriptionCount", out, descriptionCount);
     }
-    NCFRESULT ReservedTrack18() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack19() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack20() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedTrack21() override { return NCF_E_NOTIMPL; }
 };
 
 class FakeTrack : public FakeTrackBase<ITrackInfo> {
@@ -99,7 +88,6 @@ public:
         }
         return result;
     }
-    NCFRESULT ReservedVideoTrack23() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetVideoSampleDescription(ncfUInt32, IVideoSampleDescription** out) override {
         return giveObject("GetVideoSampleDescription", out, description);
     }

@@ -53,7 +53,6 @@ public:
         }
         return answers_.forcedResult;
     }
-    NCFRESULT ReservedEditorSetting() override { return NCF_E_NOTIMPL; }
     NCFRESULT GetNamedSetting(const ncfUTF8* key, ncfUInt32* value, ncfUInt64* out2,
                               void*) override {
         const bool zeroed = *value == 0 && *out2 == 0 && key[255] == 0;

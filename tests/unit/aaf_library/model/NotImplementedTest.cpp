@@ -47,7 +47,6 @@ void ExpectNotImplemented(const char* name, std::size_t operations) {
     }
 }
 
-// clang-format off
 TEST(NotImplemented, AnswersInEverySlotOfEveryInterface) {
     ExpectNotImplemented<IAAFAES3PCMDescriptor>("IAAFAES3PCMDescriptor", 1);
     ExpectNotImplemented<IAAFAES3PCMDescriptor2>("IAAFAES3PCMDescriptor2", 15);
@@ -227,6 +226,5 @@ TEST(NotImplemented, AnswersInEverySlotOfEveryInterface) {
     ExpectNotImplemented<IEnumAAFTaggedValues>("IEnumAAFTaggedValues", 5);
     ExpectNotImplemented<IEnumAAFTypeDefs>("IEnumAAFTypeDefs", 5);
 }
-// clang-format on
 
 }  // namespace

@@ -57,7 +57,6 @@ public:
         isStarted = result >= 0;
         return result;
     }
-    NCFRESULT ReservedVideoReaderOperation() override { return NCF_E_NOTIMPL; }
     NCFRESULT ReleaseQT() override {
         isStarted = false;
         return enter("ReleaseQT");
@@ -72,7 +71,6 @@ public:
     ncfUInt32 channels = 2;
     ncfUInt64 filled = ~ncfUInt64{0};  // bytes written at most
 
-    NCFRESULT ReservedAudioReaderOperation() override { return NCF_E_NOTIMPL; }
     NCFRESULT SetParams(ncfUInt32 track, ncfUInt32 bytes, ncfUInt8 littleEndian, double rate,
                         ncfUInt32& out) override {
         journal->add("sound.SetParams " + std::to_string(track) + " " + std::to_string(bytes) +

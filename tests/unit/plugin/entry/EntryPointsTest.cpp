@@ -72,8 +72,6 @@ public:
         journal_.add(AttributeLine(attribute, valueType, value, bytes));
         return --failAt_ == 0 ? NCF_E_ACCESSDENIED : NCF_OK;
     }
-    NCFRESULT ReservedPluginDefinitionA() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedPluginDefinitionB() override { return NCF_E_NOTIMPL; }
     NCFRESULT Define(const GUID& id, ncfUInt32 major, ncfUInt32 minor, const char* name,
                      const GUID& secondId, const char* vendor, ncfUInt32 count,
                      ncfUInt32 last) override {
@@ -96,8 +94,6 @@ public:
         journal_.add(AttributeLine(attribute, valueType, value, bytes));
         return --failAt_ == 0 ? NCF_E_ACCESSDENIED : NCF_OK;
     }
-    NCFRESULT ReservedComponentDefinitionA() override { return NCF_E_NOTIMPL; }
-    NCFRESULT ReservedComponentDefinitionB() override { return NCF_E_NOTIMPL; }
     NCFRESULT Define(const GUID& id, const GUID& type, ncfUInt32 major, ncfUInt32 minor,
                      const GUID& classId, const char* name) override {
         journal_.add("define " + TextOfGuid(id) + " " + TextOfGuid(type) + " " +

@@ -1,10 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "reference_host/util/text/Encodings.h"
+#include "text/Encodings.h"
 
 #include <algorithm>
 
-namespace host::text {
+namespace encodings {
 
 namespace {
 
@@ -246,4 +246,4 @@ std::wstring ToWideLossy(std::u32string_view text) {
     return EncodeLossy<std::wstring>(text, AppendWide);
 }
 
-}  // namespace host::text
+}  // namespace encodings

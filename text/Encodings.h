@@ -12,7 +12,7 @@
 // as the lone surrogate U+DC00 plus the byte and becomes that byte again on the
 // way back to UTF-8. Other lone surrogates, as Windows file names may hold, pass
 // between the wide encodings unchanged but have no place in UTF-8.
-namespace host::text {
+namespace encodings {
 
 bool IsSurrogate(char32_t c);
 bool HoldsSurrogate(std::u32string_view text);
@@ -33,4 +33,4 @@ std::string ToUtf8Lossy(std::u32string_view text);
 std::u16string ToUtf16Lossy(std::u32string_view text);
 std::wstring ToWideLossy(std::u32string_view text);
 
-}  // namespace host::text
+}  // namespace encodings
