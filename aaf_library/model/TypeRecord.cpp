@@ -14,9 +14,9 @@ namespace {
 // Natural alignment of one native value: that of its largest member.
 std::size_t AlignmentOf(const TypeDefinition& type) {
     const TypeDefinition& plain = type.Resolved();
-    if (const auto* record = dynamic_cast<const TypeRecord*>(&plain)) {
+    if (plain.kind() == TypeKind::Record) {
         std::size_t largest = 1;
-        for (const TypeDefinition* member : record->types()) {
+        for (const TypeDefinition* member : static_cast<const TypeRecord&>(plain).types()) {
             largest = std::max(largest, AlignmentOf(*member));
         }
         return largest;
