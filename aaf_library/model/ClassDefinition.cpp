@@ -23,6 +23,12 @@ void ClassDefinition::TakeBuiltIn(const BuiltInClass& entry) {
     concrete_ = entry.concrete;
     builtIn_ = entry.properties;
     properties_.resize(builtIn_.size());
+    // Numbers that are the file's own are allotted in the order in which classes come.
+    for (std::size_t index = 0; index < builtIn_.size(); ++index) {
+        if (builtIn_[index].key.pid == kNoPropertyId) {
+            PropertyAt(index);
+        }
+    }
 }
 
 bool ClassDefinition::IsKindOf(const GUID& classId) const {
@@ -42,12 +48,11 @@ struct ClassDefinition::Searched {
 };
 
 ClassDefinition::Searched ClassDefinition::SearchedAt(std::size_t index) const {
-    if (index < builtIn_.size()) {
-        const BuiltInProperty& entry = builtIn_[index];
-        return {entry.key.id, entry.key.pid, entry.unique};
+    if (const RefPtr<PropertyDefinition>& property = properties_[index]) {
+        return {property->id(), property->pid(), property->IsUnique()};
     }
-    const PropertyDefinition& property = *properties_[index];
-    return {property.id(), property.pid(), property.IsUnique()};
+    const BuiltInProperty& entry = builtIn_[index];
+    return {entry.key.id, entry.key.pid, entry.unique};
 }
 
 PropertyDefinition* ClassDefinition::PropertyAt(std::size_t index) {
@@ -58,7 +63,7 @@ PropertyDefinition* ClassDefinition::PropertyAt(std::size_t index) {
             new PropertyDefinition(*this, entry.key.pid, entry.type, entry.optional, entry.unique);
         property->JoinModel(*model());
         property->SetBuiltInIdentity(entry.key.id, entry.name);
-        model()->EnterProperty(*property);
+        property->SetPid(model()->EnterProperty(*property));
         property->Keep();
     }
     return property.get();

@@ -178,10 +178,10 @@ TypeDefinition& Model::Enter(RefPtr<TypeDefinition> type) {
 ClassDefinition* Model::AddBuiltInClass(const BuiltInClass& entry) {
     RefPtr<ClassDefinition> definition(new ClassDefinition);
     definition->JoinModel(*this);
-    definition->TakeBuiltIn(entry);
     if (entry.parent != entry.id) {
         definition->SetParent(FindClass(entry.parent));
     }
+    definition->TakeBuiltIn(entry);
     return &Enter(std::move(definition));
 }
 
