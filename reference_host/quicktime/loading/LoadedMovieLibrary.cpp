@@ -45,7 +45,7 @@ const MovieLibrary* Library() {
 }
 
 std::string WhyMissing() {
-    return "the multimedia library can't be loaded: " + Loaded().problem;
+    return "it can't be loaded: " + Loaded().problem;
 }
 
 }  // namespace
