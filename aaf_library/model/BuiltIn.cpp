@@ -26,14 +26,26 @@ const T* Find(const Index<T>& index, const GUID& id) {
     return found == index.end() ? nullptr : found->second;
 }
 
-Index<BuiltInProperty> IndexOfProperties() {
-    Index<BuiltInProperty> index;
+struct OwnedProperty {
+    const BuiltInProperty* property = nullptr;
+    const BuiltInClass* owner = nullptr;
+};
+using PropertyIndex = std::unordered_map<GUID, OwnedProperty, GuidHash>;
+
+PropertyIndex IndexOfProperties() {
+    PropertyIndex index;
     for (const BuiltInClass& entry : BuiltInClasses()) {
         for (const BuiltInProperty& property : entry.properties) {
-            index.emplace(property.key.id, &property);
+            index.emplace(property.key.id, OwnedProperty{&property, &entry});
         }
     }
     return index;
+}
+
+OwnedProperty FindOwned(const GUID& id) {
+    static const PropertyIndex index = IndexOfProperties();
+    const auto found = index.find(id);
+    return found == index.end() ? OwnedProperty{} : found->second;
 }
 
 }  // namespace
@@ -49,8 +61,11 @@ const BuiltInType* FindBuiltInType(const GUID& id) {
 }
 
 const BuiltInProperty* FindBuiltInProperty(const GUID& id) {
-    static const Index<BuiltInProperty> index = IndexOfProperties();
-    return Find(index, id);
+    return FindOwned(id).property;
+}
+
+const BuiltInClass* FindClassOfBuiltInProperty(const GUID& id) {
+    return FindOwned(id).owner;
 }
 
 }  // namespace aaf

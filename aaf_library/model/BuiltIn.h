@@ -98,5 +98,7 @@ Span<BuiltInDefinition> BuiltInContainerDefinitions();
 const BuiltInClass* FindBuiltInClass(const GUID& id);
 const BuiltInType* FindBuiltInType(const GUID& id);
 const BuiltInProperty* FindBuiltInProperty(const GUID& id);
+// The class that has the built-in property with that id.
+const BuiltInClass* FindClassOfBuiltInProperty(const GUID& id);
 
 }  // namespace aaf

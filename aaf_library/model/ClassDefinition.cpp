@@ -11,8 +11,23 @@ namespace aaf {
 
 ClassDefinition::~ClassDefinition() {
     for (const RefPtr<PropertyDefinition>& property : properties_) {
-        model()->ForgetProperty(*property);
-        property->Free();
+        if (property) {
+            model()->ForgetProperty(*property);
+            property->Free();
+        }
+    }
+}
+
+void ClassDefinition::TakeBuiltIn(const BuiltInClass& entry) {
+    SetBuiltInIdentity(entry.id, entry.name);
+    concrete_ = entry.concrete;
+    builtIn_ = entry.properties;
+    properties_.resize(builtIn_.size());
+    // Numbers that are the file's own are allotted in the order in which classes come.
+    for (std::size_t index = 0; index < builtIn_.size(); ++index) {
+        if (builtIn_[index].key.pid == kNoPropertyId) {
+            PropertyAt(index);
+        }
     }
 }
 
@@ -25,37 +40,64 @@ bool ClassDefinition::IsKindOf(const GUID& classId) const {
     return false;
 }
 
-PropertyDefinition* ClassDefinition::FindProperty(const GUID& id) const {
-    for (const ClassDefinition* at = this; at != nullptr; at = at->parent_) {
-        for (const RefPtr<PropertyDefinition>& property : at->properties_) {
-            if (property->id() == id) {
-                return property.get();
+// What a search looks at, of a row of the shared table or of a definition.
+struct ClassDefinition::Searched {
+    const GUID& id;
+    PropertyId pid;
+    bool unique;
+};
+
+ClassDefinition::Searched ClassDefinition::SearchedAt(std::size_t index) const {
+    if (const RefPtr<PropertyDefinition>& property = properties_[index]) {
+        return {property->id(), property->pid(), property->IsUnique()};
+    }
+    const BuiltInProperty& entry = builtIn_[index];
+    return {entry.key.id, entry.key.pid, entry.unique};
+}
+
+PropertyDefinition* ClassDefinition::PropertyAt(std::size_t index) {
+    RefPtr<PropertyDefinition>& property = properties_[index];
+    if (!property) {
+        const BuiltInProperty& entry = builtIn_[index];
+        property =
+            new PropertyDefinition(*this, entry.key.pid, entry.type, entry.optional, entry.unique);
+        property->JoinModel(*model());
+        property->SetBuiltInIdentity(entry.key.id, entry.name);
+        property->SetPid(model()->EnterProperty(*property));
+        property->Keep();
+    }
+    return property.get();
+}
+
+template <class Fits>
+PropertyDefinition* ClassDefinition::FindWhere(const Fits& fits) {
+    for (ClassDefinition* at = this; at != nullptr; at = at->parent_) {
+        for (std::size_t index = 0; index < at->properties_.size(); ++index) {
+            if (fits(at->SearchedAt(index))) {
+                return at->PropertyAt(index);
             }
         }
     }
     return nullptr;
 }
 
-PropertyDefinition* ClassDefinition::FindProperty(PropertyId pid) const {
-    for (const ClassDefinition* at = this; at != nullptr; at = at->parent_) {
-        for (const RefPtr<PropertyDefinition>& property : at->properties_) {
-            if (property->pid() == pid) {
-                return property.get();
-            }
-        }
+const std::vector<RefPtr<PropertyDefinition>>& ClassDefinition::properties() {
+    for (std::size_t index = 0; index < builtIn_.size(); ++index) {
+        PropertyAt(index);
     }
-    return nullptr;
+    return properties_;
 }
 
-PropertyDefinition* ClassDefinition::FindUniqueProperty() const {
-    for (const ClassDefinition* at = this; at != nullptr; at = at->parent_) {
-        for (const RefPtr<PropertyDefinition>& property : at->properties_) {
-            if (property->IsUnique()) {
-                return property.get();
-            }
-        }
-    }
-    return nullptr;
+PropertyDefinition* ClassDefinition::FindProperty(const GUID& id) {
+    return FindWhere([&id](const Searched& property) { return property.id == id; });
+}
+
+PropertyDefinition* ClassDefinition::FindProperty(PropertyId pid) {
+    return FindWhere([pid](const Searched& property) { return property.pid == pid; });
+}
+
+PropertyDefinition* ClassDefinition::FindUniqueProperty() {
+    return FindWhere([](const Searched& property) { return property.unique; });
 }
 
 PropertyDefinition& ClassDefinition::AddProperty(const GUID& id, const std::wstring& name,
@@ -95,7 +137,7 @@ HRESULT ClassDefinition::Initialize(aafUID_constref classID, IAAFClassDef* paren
 HRESULT ClassDefinition::GetPropertyDefs(IEnumAAFPropertyDefs** enumerator) {
     return MakeEnumerator<IAAFPropertyDef>(
         [self = RefPtr<ClassDefinition>(this)](std::size_t index) {
-            return index < self->properties_.size() ? RefPtr<Unknown>(self->properties_[index])
+            return index < self->properties_.size() ? RefPtr<Unknown>(self->PropertyAt(index))
                                                     : nullptr;
         },
         enumerator);
@@ -122,8 +164,8 @@ HRESULT ClassDefinition::RegisterProperty(const GUID& id, aafCharacter_constptr 
     if (IsClosedToExtension()) {
         return AAFRESULT_NOT_EXTENDABLE;
     }
-    for (const RefPtr<PropertyDefinition>& property : properties_) {
-        if (property->id() == id) {
+    for (std::size_t index = 0; index < properties_.size(); ++index) {
+        if (SearchedAt(index).id == id) {
             return AAFRESULT_INVALID_PARAM;
         }
     }

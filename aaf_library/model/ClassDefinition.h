@@ -4,6 +4,7 @@
 
 #include <vector>
 
+#include "aaf_library/model/BuiltIn.h"
 #include "aaf_library/model/PropertyDefinition.h"
 #include "not_implemented/AAFMetaDefinitions.h"
 
@@ -11,6 +12,9 @@ namespace aaf {
 
 // A class of the object model with its own properties. Kept by the model once
 // it is registered.
+//
+// A built-in class looks its properties up in the table that all models share; their definitions
+// come into being when they are first looked up. Registered ones stand behind them.
 class ClassDefinition : public Implements<MetaDefinition, IAAFClassDef> {
 public:
     // Null for a root class.
@@ -22,12 +26,16 @@ public:
     // In the dictionary, as opposed to being built by a caller.
     bool IsRegistered() const { return registered_; }
     void MarkRegistered() { registered_ = true; }
+    // Once, before anything is added.
+    void TakeBuiltIn(const BuiltInClass& entry);
 
-    const std::vector<RefPtr<PropertyDefinition>>& properties() const { return properties_; }
+    const std::vector<RefPtr<PropertyDefinition>>& properties();
+    // Whether it has more than the built-in model knows.
+    bool IsExtended() const { return !IsBuiltIn() || properties_.size() > builtIn_.size(); }
     // This class and its parents; null when unknown.
-    PropertyDefinition* FindProperty(const GUID& id) const;
-    PropertyDefinition* FindProperty(PropertyId pid) const;
-    PropertyDefinition* FindUniqueProperty() const;
+    PropertyDefinition* FindProperty(const GUID& id);
+    PropertyDefinition* FindProperty(PropertyId pid);
+    PropertyDefinition* FindUniqueProperty();
     // Adds without the checks that a caller's registration has. pid kNoPropertyId: the next free.
     PropertyDefinition& AddProperty(const GUID& id, const std::wstring& name, const GUID& typeId,
                                     bool optional, bool unique, PropertyId pid = kNoPropertyId);
@@ -58,13 +66,20 @@ protected:
 
 private:
     bool IsClosedToExtension() const;
+    struct Searched;
+    Searched SearchedAt(std::size_t index) const;
+    PropertyDefinition* PropertyAt(std::size_t index);
+    // The first one of this class and its parents.
+    template <class Fits>
+    PropertyDefinition* FindWhere(const Fits& fits);
     HRESULT RegisterProperty(const GUID& id, aafCharacter_constptr name, IAAFTypeDef* typeDef,
                              bool optional, bool unique, IAAFPropertyDef** propDef);
 
     ClassDefinition* parent_ = nullptr;
     bool concrete_ = false;
     bool registered_ = false;
-    std::vector<RefPtr<PropertyDefinition>> properties_;
+    Span<BuiltInProperty> builtIn_;
+    std::vector<RefPtr<PropertyDefinition>> properties_;  // null: not looked up yet
 };
 
 }  // namespace aaf

@@ -6,6 +6,20 @@
 
 namespace aaf {
 
+const std::wstring& MetaDefinition::name() const {
+    if (name_.empty() && builtInName_ != nullptr) {
+        name_ = Widen(builtInName_);
+    }
+    return name_;
+}
+
+void MetaDefinition::SetBuiltInIdentity(const GUID& id, const char* name) {
+    id_ = id;
+    builtInName_ = name;
+    initialized_ = true;
+    builtIn_ = true;
+}
+
 HRESULT MetaDefinition::SetIdentity(const GUID& id, const std::wstring& name) {
     if (initialized_) {
         return AAFRESULT_ALREADY_INITIALIZED;
@@ -43,16 +57,17 @@ HRESULT MetaDefinition::SetName(aafCharacter_constptr name) {
     if (name == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
+    builtInName_ = nullptr;
     name_ = name;
     return AAFRESULT_SUCCESS;
 }
 
 HRESULT MetaDefinition::GetName(aafCharacter* name, aafUInt32 bufSize) {
-    return CopyText(name_, name, bufSize);
+    return CopyText(this->name(), name, bufSize);
 }
 
 HRESULT MetaDefinition::GetNameBufLen(aafUInt32* bufSize) {
-    return TextSize(name_, bufSize);
+    return TextSize(name(), bufSize);
 }
 
 HRESULT MetaDefinition::SetDescription(aafCharacter_constptr description) {

@@ -15,11 +15,13 @@ namespace aaf {
 class MetaDefinition : public Implements<Unknown, IAAFMetaDefinition> {
 public:
     const GUID& id() const { return id_; }
-    const std::wstring& name() const { return name_; }
+    const std::wstring& name() const;
     bool IsInitialized() const { return initialized_; }
     // Part of the built-in model, as opposed to registered by a caller or read from a file.
     bool IsBuiltIn() const { return builtIn_; }
     void MarkBuiltIn() { builtIn_ = true; }
+    // Identity and mark of a built-in definition. The name is ASCII and outlives all models.
+    void SetBuiltInIdentity(const GUID& id, const char* name);
 
     // Fails with AAFRESULT_ALREADY_INITIALIZED the second time.
     HRESULT SetIdentity(const GUID& id, const std::wstring& name);
@@ -41,7 +43,8 @@ protected:
 
 private:
     GUID id_{};
-    std::wstring name_;
+    const char* builtInName_ = nullptr;  // until somebody asks for the name
+    mutable std::wstring name_;
     std::wstring description_;
     bool described_ = false;
     bool initialized_ = false;

@@ -178,18 +178,10 @@ TypeDefinition& Model::Enter(RefPtr<TypeDefinition> type) {
 ClassDefinition* Model::AddBuiltInClass(const BuiltInClass& entry) {
     RefPtr<ClassDefinition> definition(new ClassDefinition);
     definition->JoinModel(*this);
-    definition->MarkBuiltIn();
-    definition->SetIdentity(entry.id, Widen(entry.name));
-    definition->SetConcrete(entry.concrete);
     if (entry.parent != entry.id) {
         definition->SetParent(FindClass(entry.parent));
     }
-    for (const BuiltInProperty& property : entry.properties) {
-        definition
-            ->AddProperty(property.key.id, Widen(property.name), property.type, property.optional,
-                          property.unique, property.key.pid)
-            .MarkBuiltIn();
-    }
+    definition->TakeBuiltIn(entry);
     return &Enter(std::move(definition));
 }
 
@@ -257,7 +249,13 @@ void Model::KeepType(TypeDefinition& type) {
 
 PropertyDefinition* Model::FindProperty(const GUID& id) const {
     const auto found = propertyById_.find(id);
-    return found == propertyById_.end() ? nullptr : found->second;
+    if (found != propertyById_.end()) {
+        return found->second;
+    }
+    // One of a class that is there, but which nobody has looked at yet.
+    const BuiltInClass* const entry = FindClassOfBuiltInProperty(id);
+    const auto owner = entry == nullptr ? classById_.end() : classById_.find(entry->id);
+    return owner == classById_.end() ? nullptr : owner->second->FindProperty(id);
 }
 
 bool Model::HasProperty(const GUID& id) const {

@@ -36,8 +36,8 @@ TypeDefinition* Model::TypeLike(const TypeDefinition& source) {
         TypeLike(*source.element());
     }
     if (source.kind() == TypeKind::Record) {
-        for (const TypeRecord::Member& member : static_cast<const TypeRecord&>(source).members()) {
-            TypeLike(*member.type);
+        for (const TypeDefinition* type : static_cast<const TypeRecord&>(source).types()) {
+            TypeLike(*type);
         }
     }
     RefPtr<TypeDefinition> made = MakeType(*this, facts);

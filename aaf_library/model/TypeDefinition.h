@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <memory>
+#include <vector>
+
 #include "aaf_library/model/BuiltIn.h"
 #include "aaf_library/model/MetaDefinition.h"
 #include "aaf_library/model/PropertyValue.h"
@@ -29,6 +32,29 @@ struct TypeMember {
     GUID id{};  // record: type of the member; extendible enumeration: value; weak reference:
                 // property on the path from the root to the set of targets
     aafInt64 value = 0;  // enumeration: value
+};
+
+// The parts of a type in order. Copies share them until one is added to: those of a built-in type
+// are the same in all models.
+class TypeMembers {
+public:
+    TypeMembers() = default;
+    TypeMembers(std::vector<TypeMember> members)
+        : members_(std::make_shared<std::vector<TypeMember>>(std::move(members))) {}
+
+    bool empty() const { return size() == 0; }
+    std::size_t size() const { return members_ ? members_->size() : 0; }
+    const TypeMember& operator[](std::size_t index) const { return (*members_)[index]; }
+    const TypeMember* begin() const { return members_ ? members_->data() : nullptr; }
+    const TypeMember* end() const { return begin() + size(); }
+    void push_back(TypeMember member) {
+        std::vector<TypeMember> longer(begin(), end());
+        longer.push_back(std::move(member));
+        *this = std::move(longer);
+    }
+
+private:
+    std::shared_ptr<const std::vector<TypeMember>> members_;
 };
 
 // A type of values. It knows two layouts of each value: the native one of the C

@@ -10,7 +10,7 @@
 namespace aaf {
 
 HRESULT TypeEnumeration::Setup(const GUID& id, const std::wstring& name, TypeDefinition& element,
-                               std::vector<Member> members) {
+                               TypeMembers members) {
     const HRESULT result = SetIdentity(id, name);
     if (result >= 0) {
         element_ = &element;

@@ -16,8 +16,8 @@ public:
     TypeEnumeration() : Implements(TypeKind::Enumeration) {}
 
     HRESULT Setup(const GUID& id, const std::wstring& name, TypeDefinition& element,
-                  std::vector<Member> members);
-    const std::vector<Member>& members() const { return members_; }
+                  TypeMembers members);
+    const TypeMembers& members() const { return members_; }
 
     TypeDefinition* element() const override { return element_; }
     std::size_t StoredSize() const override;
@@ -49,7 +49,7 @@ private:
     bool IsSignedElement() const;
 
     TypeDefinition* element_ = nullptr;
-    std::vector<Member> members_;
+    TypeMembers members_;
     std::size_t nativeSize_ = sizeof(aafInt32);
 };
 

@@ -5,7 +5,7 @@
 namespace aaf {
 
 HRESULT TypeExtendibleEnumeration::Setup(const GUID& id, const std::wstring& name,
-                                         std::vector<Member> members) {
+                                         TypeMembers members) {
     const HRESULT result = SetIdentity(id, name);
     if (result >= 0) {
         members_ = std::move(members);

@@ -16,8 +16,8 @@ public:
 
     TypeExtendibleEnumeration() : Implements(TypeKind::ExtendibleEnumeration) {}
 
-    HRESULT Setup(const GUID& id, const std::wstring& name, std::vector<Member> members);
-    const std::vector<Member>& members() const { return members_; }
+    HRESULT Setup(const GUID& id, const std::wstring& name, TypeMembers members);
+    const TypeMembers& members() const { return members_; }
 
     std::size_t StoredSize() const override { return sizeof(GUID); }
     std::size_t NativeSize() const override { return sizeof(GUID); }
@@ -45,7 +45,7 @@ public:
 private:
     const Member* FindMember(const GUID& value) const;
 
-    std::vector<Member> members_;
+    TypeMembers members_;
 };
 
 }  // namespace aaf

@@ -59,15 +59,16 @@ const Kind& EntryOf(TypeKind kind) {
 }
 
 HRESULT SetupRecord(TypeRecord& type, Model& model, const TypeFacts& facts) {
-    std::vector<TypeRecord::Member> members;
+    std::vector<TypeDefinition*> types;
+    types.reserve(facts.members.size());
     for (const TypeMember& member : facts.members) {
         TypeDefinition* const found = model.FindType(member.id);
         if (found == nullptr) {
             return AAFRESULT_BAD_TYPE;
         }
-        members.push_back({member.name, found});
+        types.push_back(found);
     }
-    return type.Setup(facts.id, facts.name, std::move(members));
+    return type.Setup(facts.id, facts.name, facts.members, std::move(types));
 }
 
 HRESULT SetupWeak(TypeWeakReference& type, const TypeFacts& facts) {
@@ -119,37 +120,45 @@ HRESULT Setup(TypeDefinition& type, Model& model, const TypeFacts& facts) {
     }
 }
 
-std::vector<TypeMember> MembersOf(const TypeDefinition& type) {
-    std::vector<TypeMember> members;
+TypeMembers MembersOf(const TypeDefinition& type) {
     switch (type.kind()) {
         case TypeKind::Enumeration:
             return static_cast<const TypeEnumeration&>(type).members();
         case TypeKind::ExtendibleEnumeration:
             return static_cast<const TypeExtendibleEnumeration&>(type).members();
         case TypeKind::Record:
-            for (const auto& member : static_cast<const TypeRecord&>(type).members()) {
-                members.push_back({member.name, member.type->id()});
-            }
-            return members;
-        case TypeKind::WeakReference:
+            return static_cast<const TypeRecord&>(type).members();
+        case TypeKind::WeakReference: {
+            std::vector<TypeMember> steps;
             for (const GUID& step : static_cast<const TypeWeakReference&>(type).targetSet()) {
-                members.push_back({{}, step});
+                steps.push_back({{}, step});
             }
-            return members;
+            return steps;
+        }
         default:
-            return members;
+            return {};
     }
+}
+
+std::vector<TypeFacts> AllBuiltInFacts() {
+    std::vector<TypeFacts> all;
+    all.reserve(BuiltInTypes().size());
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        std::vector<TypeMember> members;
+        for (const BuiltInMember& member : entry.members) {
+            members.push_back({Widen(member.name), member.id, member.value});
+        }
+        all.push_back({entry.id, Widen(entry.name), entry.kind, entry.target, entry.size,
+                       entry.isSigned, std::move(members)});
+    }
+    return all;
 }
 
 }  // namespace
 
-TypeFacts FactsOf(const BuiltInType& entry) {
-    TypeFacts facts{entry.id,   Widen(entry.name), entry.kind, entry.target,
-                    entry.size, entry.isSigned,    {}};
-    for (const BuiltInMember& member : entry.members) {
-        facts.members.push_back({Widen(member.name), member.id, member.value});
-    }
-    return facts;
+const TypeFacts& FactsOf(const BuiltInType& entry) {
+    static const std::vector<TypeFacts> all = AllBuiltInFacts();
+    return all[static_cast<std::size_t>(&entry - BuiltInTypes().begin())];
 }
 
 TypeFacts FactsOf(const TypeDefinition& type) {

@@ -17,10 +17,11 @@ struct TypeFacts {
     GUID target{};           // element, renamed or character type; class referred to
     std::uint32_t size = 0;  // integer: bytes; fixed array: elements
     bool isSigned = false;   // integer
-    std::vector<TypeMember> members;
+    TypeMembers members;
 };
 
-TypeFacts FactsOf(const BuiltInType& entry);
+// Those of a built-in type are the same object for the whole process.
+const TypeFacts& FactsOf(const BuiltInType& entry);
 TypeFacts FactsOf(const TypeDefinition& type);
 
 // References name a class; all other targets are types.

@@ -14,10 +14,10 @@ namespace {
 // Natural alignment of one native value: that of its largest member.
 std::size_t AlignmentOf(const TypeDefinition& type) {
     const TypeDefinition& plain = type.Resolved();
-    if (const auto* record = dynamic_cast<const TypeRecord*>(&plain)) {
+    if (plain.kind() == TypeKind::Record) {
         std::size_t largest = 1;
-        for (const TypeRecord::Member& member : record->members()) {
-            largest = std::max(largest, AlignmentOf(*member.type));
+        for (const TypeDefinition* member : static_cast<const TypeRecord&>(plain).types()) {
+            largest = std::max(largest, AlignmentOf(*member));
         }
         return largest;
     }
@@ -50,15 +50,17 @@ bool MayBeMember(const TypeDefinition& type) {
 
 }  // namespace
 
-HRESULT TypeRecord::Setup(const GUID& id, const std::wstring& name, std::vector<Member> members) {
+HRESULT TypeRecord::Setup(const GUID& id, const std::wstring& name, TypeMembers members,
+                          std::vector<TypeDefinition*> types) {
     const HRESULT result = SetIdentity(id, name);
     if (result < 0) {
         return result;
     }
     members_ = std::move(members);
-    for (const Member& member : members_) {
-        storedSize_ += member.type->StoredSize();
-        model()->KeepType(*member.type);
+    types_ = std::move(types);
+    for (TypeDefinition* type : types_) {
+        storedSize_ += type->StoredSize();
+        model()->KeepType(*type);
     }
     return AAFRESULT_SUCCESS;
 }
@@ -66,10 +68,10 @@ HRESULT TypeRecord::Setup(const GUID& id, const std::wstring& name, std::vector<
 void TypeRecord::UseNaturalLayout() {
     std::size_t offset = 0;
     offsets_.clear();
-    for (const Member& member : members_) {
-        offset = AlignUp(offset, AlignmentOf(*member.type));
+    for (const TypeDefinition* type : types_) {
+        offset = AlignUp(offset, AlignmentOf(*type));
         offsets_.push_back(offset);
-        offset += member.type->NativeSize();
+        offset += type->NativeSize();
     }
     nativeSize_ = AlignUp(offset, AlignmentOf(*this));
 }
@@ -81,14 +83,14 @@ void TypeRecord::UseLayoutOf(const TypeRecord& other) {
 
 void TypeRecord::AppendStored(const std::uint8_t* native, Bytes& out) const {
     for (std::size_t i = 0; i < members_.size(); ++i) {
-        members_[i].type->AppendStored(native + offsets_[i], out);
+        types_[i]->AppendStored(native + offsets_[i], out);
     }
 }
 
 void TypeRecord::CopyNative(const std::uint8_t* stored, std::uint8_t* native) const {
     for (std::size_t i = 0; i < members_.size(); ++i) {
-        members_[i].type->CopyNative(stored, native + offsets_[i]);
-        stored += members_[i].type->StoredSize();
+        types_[i]->CopyNative(stored, native + offsets_[i]);
+        stored += types_[i]->StoredSize();
     }
 }
 
@@ -101,7 +103,8 @@ HRESULT TypeRecord::Initialize(aafUID_constref id, IAAFTypeDef** memberTypes,
     if (IsInitialized()) {
         return AAFRESULT_ALREADY_INITIALIZED;
     }
-    std::vector<Member> members;
+    std::vector<TypeMember> members;
+    std::vector<TypeDefinition*> types;
     for (aafUInt32 i = 0; i < numMembers; ++i) {
         if (memberTypes[i] == nullptr || memberNames[i] == nullptr) {
             return AAFRESULT_NULL_PARAM;
@@ -113,9 +116,10 @@ HRESULT TypeRecord::Initialize(aafUID_constref id, IAAFTypeDef** memberTypes,
         if (!MayBeMember(*type)) {
             return AAFRESULT_BAD_TYPE;
         }
-        members.push_back({memberNames[i], type});
+        members.push_back({memberNames[i], type->id()});
+        types.push_back(type);
     }
-    return Setup(id, typeName, std::move(members));
+    return Setup(id, typeName, std::move(members), std::move(types));
 }
 
 HRESULT TypeRecord::CheckMember(aafUInt32 index) const {
@@ -130,7 +134,7 @@ HRESULT TypeRecord::GetMemberType(aafUInt32 index, IAAFTypeDef** typeDef) {
         return AAFRESULT_NULL_PARAM;
     }
     const HRESULT result = CheckMember(index);
-    return result < 0 ? result : GiveOut(members_[index].type, typeDef);
+    return result < 0 ? result : GiveOut(types_[index], typeDef);
 }
 
 HRESULT TypeRecord::GetMemberName(aafUInt32 index, aafCharacter* name, aafUInt32 bufSize) {
@@ -166,7 +170,7 @@ HRESULT TypeRecord::CreateValueFromValues(IAAFPropertyValue** memberValues, aafU
         if (memberValues[i] == nullptr) {
             return AAFRESULT_NULL_PARAM;
         }
-        if (value == nullptr || value->bytes().size() != members_[i].type->StoredSize()) {
+        if (value == nullptr || value->bytes().size() != types_[i]->StoredSize()) {
             return AAFRESULT_BAD_TYPE;
         }
         stored.insert(stored.end(), value->bytes().begin(), value->bytes().end());
@@ -187,7 +191,7 @@ HRESULT TypeRecord::CheckStruct(aafUInt32 dataSize) const {
 bool TypeRecord::LayoutFits() const {
     // A member's own layout may have been registered anew and grown.
     for (std::size_t i = 0; i < members_.size(); ++i) {
-        const std::size_t size = members_[i].type->NativeSize();
+        const std::size_t size = types_[i]->NativeSize();
         if (size == 0 || size > nativeSize_ || offsets_[i] > nativeSize_ - size) {
             return false;
         }
@@ -211,7 +215,7 @@ HRESULT TypeRecord::CreateValueFromStruct(aafMemPtr_t initData, aafUInt32 initDa
 std::size_t TypeRecord::StoredOffset(aafUInt32 index) const {
     std::size_t offset = 0;
     for (aafUInt32 i = 0; i < index; ++i) {
-        offset += members_[i].type->StoredSize();
+        offset += types_[i]->StoredSize();
     }
     return offset;
 }
@@ -232,8 +236,8 @@ HRESULT TypeRecord::GetValue(IAAFPropertyValue* inPropVal, aafUInt32 index,
         return AAFRESULT_BAD_SIZE;
     }
     const auto first = value->bytes().begin() + static_cast<std::ptrdiff_t>(StoredOffset(index));
-    const auto size = static_cast<std::ptrdiff_t>(members_[index].type->StoredSize());
-    return GiveValue(*members_[index].type, Bytes(first, first + size), outPropVal);
+    const auto size = static_cast<std::ptrdiff_t>(types_[index]->StoredSize());
+    return GiveValue(*types_[index], Bytes(first, first + size), outPropVal);
 }
 
 HRESULT TypeRecord::GetStruct(IAAFPropertyValue* propVal, aafMemPtr_t data, aafUInt32 dataSize) {
@@ -267,7 +271,7 @@ HRESULT TypeRecord::SetValue(IAAFPropertyValue* propVal, aafUInt32 index,
         return result;
     }
     auto* member = ImplementationAs<PropertyValue>(memberPropVal);
-    if (member == nullptr || member->bytes().size() != members_[index].type->StoredSize()) {
+    if (member == nullptr || member->bytes().size() != types_[index]->StoredSize()) {
         return AAFRESULT_BAD_TYPE;
     }
     value->BytesToChange().resize(storedSize_);
@@ -313,7 +317,7 @@ HRESULT TypeRecord::RegisterMembers(aafUInt32* offsets, aafUInt32 numMembers,
     }
     // A member that reaches beyond the structure would touch memory of others.
     for (std::size_t i = 0; i < members_.size(); ++i) {
-        const std::size_t size = members_[i].type->NativeSize();
+        const std::size_t size = types_[i]->NativeSize();
         if (size == 0 || size > structSize || offsets[i] > structSize - size) {
             return AAFRESULT_ILLEGAL_VALUE;
         }

@@ -11,19 +11,17 @@ namespace aaf {
 // caller's structure is registered apart; until then only values go in and out.
 class TypeRecord : public Implements<TypeDefinition, IAAFTypeDefRecord> {
 public:
-    struct Member {
-        std::wstring name;
-        TypeDefinition* type;
-    };
-
     TypeRecord() : Implements(TypeKind::Record) {}
 
-    HRESULT Setup(const GUID& id, const std::wstring& name, std::vector<Member> members);
+    // As many types as members.
+    HRESULT Setup(const GUID& id, const std::wstring& name, TypeMembers members,
+                  std::vector<TypeDefinition*> types);
     // The layout that a C structure with these members has.
     void UseNaturalLayout();
     // That of another record with the same members.
     void UseLayoutOf(const TypeRecord& other);
-    const std::vector<Member>& members() const { return members_; }
+    const TypeMembers& members() const { return members_; }
+    const std::vector<TypeDefinition*>& types() const { return types_; }
 
     std::size_t StoredSize() const override { return storedSize_; }
     std::size_t NativeSize() const override { return nativeSize_; }
@@ -57,8 +55,9 @@ private:
     HRESULT CheckMember(aafUInt32 index) const;
     std::size_t StoredOffset(aafUInt32 index) const;
 
-    std::vector<Member> members_;
-    std::vector<std::size_t> offsets_;  // in the caller's structure
+    TypeMembers members_;
+    std::vector<TypeDefinition*> types_;  // of the members
+    std::vector<std::size_t> offsets_;    // in the caller's structure
     std::size_t storedSize_ = 0;
     std::size_t nativeSize_ = 0;  // 0: no layout yet
 };

@@ -11,20 +11,11 @@
 #include "aaf_library/stored/StoredError.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 
-#include <algorithm>
-
 namespace aaf::stored {
 
 namespace {
 
-bool IsExtended(const ClassDefinition& definition) {
-    return !definition.IsBuiltIn() ||
-           std::any_of(
-               definition.properties().begin(), definition.properties().end(),
-               [](const RefPtr<PropertyDefinition>& property) { return !property->IsBuiltIn(); });
-}
-
-MetaClass RecordOf(const ClassDefinition& definition) {
+MetaClass RecordOf(ClassDefinition& definition) {
     MetaClass record;
     record.id = definition.id();
     record.name = definition.name();
@@ -68,7 +59,7 @@ void MetaClosure::AddExtensions() {
     // Entering a definition may look up others, which makes the lists longer.
     for (std::size_t i = 0; i < model_.classes().size(); ++i) {
         const RefPtr<ClassDefinition> definition = model_.classes()[i];
-        if (IsExtended(*definition)) {
+        if (definition->IsExtended()) {
             AddClass(definition->id());
         }
     }
@@ -98,7 +89,7 @@ void MetaClosure::EnterClass(const GUID& id) {
     if (!classes_.insert(id).second) {
         return;
     }
-    const ClassDefinition* definition = model_.FindClass(id);
+    ClassDefinition* definition = model_.FindClass(id);
     if (definition == nullptr) {
         throw StoredError("a class that is needed has no definition");
     }

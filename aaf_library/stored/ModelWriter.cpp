@@ -152,7 +152,7 @@ private:
     }
 
     const PropertyDefinition* KeyOf(const GUID& classId) {
-        const ClassDefinition* definition = model_.FindClass(classId);
+        ClassDefinition* definition = model_.FindClass(classId);
         const PropertyDefinition* key =
             definition == nullptr ? nullptr : definition->FindUniqueProperty();
         if (key == nullptr || key->type() == nullptr) {
@@ -227,14 +227,13 @@ private:
         }
     }
 
-    const std::vector<const PropertyDefinition*>& RequiredObjects(
-        const ClassDefinition& definition) {
+    const std::vector<const PropertyDefinition*>& RequiredObjects(ClassDefinition& definition) {
         const auto known = required_.find(&definition);
         if (known != required_.end()) {
             return known->second;
         }
         std::vector<const PropertyDefinition*>& out = required_[&definition];
-        for (const ClassDefinition* at = &definition; at != nullptr; at = at->parent()) {
+        for (ClassDefinition* at = &definition; at != nullptr; at = at->parent()) {
             for (const RefPtr<PropertyDefinition>& property : at->properties()) {
                 const bool wanted = !property->IsOptional() ||
                                     property->id() == prop::ContentStorage_EssenceData.id;

@@ -8,7 +8,7 @@
 #include "reference_host/cliphost/DataFiles.h"
 #include "reference_host/cliphost/MovieDiagnosis.h"
 #include "reference_host/cliphost/SampleDiagnosis.h"
-#include "reference_host/quicktime/OpenProblem.h"
+#include "reference_host/quicktime/HeaderLook.h"
 
 namespace cliphost {
 namespace {
@@ -19,7 +19,7 @@ void Finish(Session& session, Description& description) {
         description.problem = ProblemWith(session, description.movie, description.result);
     } else {
         session.TakeNotices();
-        if (host::NeedsRasterCheck(description.movie)) {
+        if (host::TellsLargePictures(description.movie)) {
             description.doubt = WrongRaster(description.movie);
         }
     }

@@ -10,6 +10,7 @@
 #include "reference_host/cliphost/ClipTracks.h"
 #include "reference_host/cliphost/Problem.h"
 #include "reference_host/header_parser/InspectHeaders.h"
+#include "reference_host/quicktime/HeaderLook.h"
 #include "reference_host/quicktime/OpenProblem.h"
 
 // What the questions about a file that fails have in common: its tracks as its

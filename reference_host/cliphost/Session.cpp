@@ -15,7 +15,7 @@
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/parameters/RegisterParameterComponents.h"
-#include "reference_host/quicktime/RegisterQuickTimeComponents.h"
+#include "reference_host/quicktime/MovieComponents.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
 
@@ -89,7 +89,12 @@ Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) 
     host::RegisterXmlComponents(*host_);
     host::RegisterParameterComponents(*host_);
     host_->RegisterComponent(NCFCompID_QTParser, header_parser::QTParserMaker());
-    host::RegisterQuickTimeComponents(*host_);
+    host_->RegisterComponent(QTWrapper::CompID_QuickTimeWrapper, host::MakerOf([](INCFUnknown*) {
+                                 return host::MakeQuickTimeWrapper();
+                             }));
+    host_->RegisterComponent(QuickTime::CompID_QuickTimeProperty, host::MakerOf([](INCFUnknown*) {
+                                 return host::MakeQuickTimeProperty();
+                             }));
 
     const std::filesystem::path module =
         options.plugin.empty() ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"

@@ -9,7 +9,7 @@
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/InspectHeaders.h"
-#include "reference_host/quicktime/QuickTimeWrapper.h"
+#include "reference_host/quicktime/MovieComponents.h"
 
 namespace cliphost {
 namespace {
@@ -136,13 +136,14 @@ std::vector<SampleTime> TimesInHeader(const header_parser::HeaderReport& header,
 
 // Of the picture; sound that only the library reads is never displayed elsewhere.
 std::vector<SampleTime> TimesInLibrary(const std::filesystem::path& movie) {
-    const auto wrapper = host::MakeRef<host::QuickTimeWrapper>();
+    const auto wrapper = host::MakeQuickTimeWrapper();
     const auto path = host::ModulePath(movie);
     host::Ref<QTWrapper::IQTWSampleTable> table;
     ncfUInt32 track = 0;
     ncfUInt64 count = 0;
-    if (wrapper->NewMovieFromFilePath(path.get()) < 0 || !wrapper->GetFirstVideoTrack(&track) ||
-        wrapper->GetSampleTable(table.Out()) < 0 || table->GetNumSamples(track, &count) < 0) {
+    if (!wrapper || wrapper->NewMovieFromFilePath(path.get()) < 0 ||
+        !wrapper->GetFirstVideoTrack(&track) || wrapper->GetSampleTable(table.Out()) < 0 ||
+        table->GetNumSamples(track, &count) < 0) {
         return {};
     }
     std::vector<SampleTime> times;

@@ -3,12 +3,11 @@
 
 #include "reference_host/quicktime/OpenProblem.h"
 
-#include <algorithm>
 #include <cerrno>
-#include <iterator>
 
 #include "reference_host/header_parser/Atom.h"
 #include "reference_host/quicktime/CodecNames.h"
+#include "reference_host/quicktime/HeaderLook.h"
 #include "reference_host/quicktime/MovieFile.h"
 #include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/RasterClaim.h"
@@ -22,10 +21,6 @@ extern "C" {
 
 namespace host {
 namespace {
-
-using header_parser::Code;
-
-constexpr ncfUInt32 kEncrypted[] = {Code("encv"), Code("enca"), Code("drmi"), Code("drms")};
 
 // Whether a codec of that code is one of the other kind of track.
 bool IsOfOtherKind(const AVCodecParameters& form) {
@@ -99,10 +94,6 @@ CodecProblem DecoderProblem(const std::filesystem::path& path, std::size_t track
     return input ? ProblemOf(*input->streams[stream]) : CodecProblem();
 }
 
-bool IsEncrypted(std::uint32_t code) {
-    return std::find(std::begin(kEncrypted), std::end(kEncrypted), code) != std::end(kEncrypted);
-}
-
 CodecProblem DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place) {
     std::string reason;
     const InputOwner input = OpenInput(path, InputView::AsPresented, reason);
@@ -119,10 +110,6 @@ std::string RasterProblem(const std::filesystem::path& path) {
     const std::string claim = stream ? FindImpossibleRaster(path, stream->index) : std::string();
     return claim.empty() ? claim
                          : "track " + std::to_string(stream->index + 1) + " of the file: " + claim;
-}
-
-bool NeedsRasterCheck(const std::filesystem::path& path) {
-    return TellsLargePictures(path);
 }
 
 }  // namespace host

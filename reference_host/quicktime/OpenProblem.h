@@ -11,9 +11,6 @@ namespace host {
 // Why the movie wrapper can't open a file, in a few words; empty when it can.
 std::string OpenProblem(const std::filesystem::path& path);
 
-// Codes of samples that nobody reads without a key.
-bool IsEncrypted(std::uint32_t code);
-
 // Why the samples of a track can't be decoded, with the code of their codec;
 // nothing when they can, or when there is no such track.
 struct CodecProblem {
@@ -30,7 +27,5 @@ CodecProblem DecoderProblem(const std::filesystem::path& path, std::size_t track
 // Why the first picture track can't have pictures as large as the file tells; empty
 // when it can.
 std::string RasterProblem(const std::filesystem::path& path);
-// Whether a movie's header tells pictures large enough to ask for that: a quick look.
-bool NeedsRasterCheck(const std::filesystem::path& path);
 
 }  // namespace host

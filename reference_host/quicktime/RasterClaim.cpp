@@ -5,13 +5,12 @@
 
 #include <algorithm>
 
-#include "reference_host/quicktime/MovieAtoms.h"
+#include "reference_host/quicktime/HeaderLook.h"
 #include "reference_host/quicktime/OpenInput.h"
 
 namespace host {
 namespace {
 
-constexpr std::int64_t kAlwaysFine = std::int64_t{4096} * 4096;
 // Stored and told sizes differ in true movies, though not by more than this.
 constexpr std::int64_t kMostTimes = 4;
 // Of the codecs that leave the size to the file, a byte of the densest stands for
@@ -80,18 +79,11 @@ Samples Inspect(AVFormatContext& input, int stream) {
 }  // namespace
 
 bool TellsLargePictures(const AVCodecParameters& form) {
-    return Raster{form.width, form.height}.Pixels() > kAlwaysFine;
-}
-
-bool TellsLargePictures(const std::filesystem::path& path) {
-    const MovieAtoms atoms = ReadMovieAtoms(path);
-    return std::any_of(atoms.tracks.begin(), atoms.tracks.end(), [](const auto& track) {
-        return std::int64_t{track.width} * track.height > kAlwaysFine;
-    });
+    return Raster{form.width, form.height}.Pixels() > kBelievedPixels;
 }
 
 std::int64_t MostPixels(const AVCodecParameters& form) {
-    return std::max(kAlwaysFine, kMostTimes * Raster{form.width, form.height}.Pixels());
+    return std::max(kBelievedPixels, kMostTimes * Raster{form.width, form.height}.Pixels());
 }
 
 std::string FindImpossibleRaster(const std::filesystem::path& path, int stream) {

@@ -11,11 +11,9 @@
 namespace host {
 
 // A description of a few bytes can claim pictures of gigabytes. Sizes up to
-// 4096 x 4096 are believed; larger ones only when the first samples say the same.
+// kBelievedPixels are believed; larger ones only when the first samples say the same.
 
 bool TellsLargePictures(const AVCodecParameters& form);
-// Whether the header of a movie file claims such a size for any of its tracks.
-bool TellsLargePictures(const std::filesystem::path& path);
 
 // The most pixels that a decoder may give a picture, for a stream whose pictures have
 // the size of `form`.

@@ -31,4 +31,7 @@ private:
     void* handle_ = nullptr;
 };
 
+// The shared library or program that holds this code; empty when the system can't tell.
+std::filesystem::path FileOfCode(const void* code);
+
 }  // namespace host::system

@@ -42,4 +42,12 @@ bool SharedLibrary::IsFoundAs(const char* name) const {
     return handle_ != nullptr && found == handle_;
 }
 
+std::filesystem::path FileOfCode(const void* code) {
+    Dl_info info{};
+    if (dladdr(code, &info) == 0 || info.dli_fname == nullptr) {
+        return {};
+    }
+    return info.dli_fname;
+}
+
 }  // namespace host::system

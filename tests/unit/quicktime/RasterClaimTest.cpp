@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/quicktime/RasterClaim.h"
 
+#include "reference_host/quicktime/HeaderLook.h"
+
 #include <gtest/gtest.h>
 
 #include <algorithm>

@@ -103,11 +103,36 @@ TEST_F(ClassDefinitions, PropertyIdMayEqualATypeId) {
     EXPECT_TRUE(Type(kAAFTypeID_Int32));
 }
 
+TEST_F(ClassDefinitions, PropertiesOfAKnownClassAreThereBeforeAnybodyAskedTheClassForThem) {
+    EXPECT_EQ(model->FindProperty(aaf::prop::GPITrigger_ActiveState.id), nullptr);
+    aaf::ClassDefinition* trigger = model->FindClass(AUID_AAFGPITrigger);
+    aaf::PropertyDefinition* state = model->FindProperty(aaf::prop::GPITrigger_ActiveState.id);
+    ASSERT_NE(state, nullptr);
+    EXPECT_EQ(&state->owner(), trigger);
+    EXPECT_EQ(state, trigger->FindProperty(aaf::prop::GPITrigger_ActiveState.pid));
+    EXPECT_EQ(state->name(), L"ActiveState");
+    EXPECT_TRUE(state->IsBuiltIn());
+}
+
+TEST_F(ClassDefinitions, BuiltInPropertiesComeInTheirOrderWhicheverWasLookedUpFirst) {
+    aaf::ClassDefinition* mob = model->FindClass(AUID_AAFMob);
+    ASSERT_NE(mob->FindProperty(aaf::prop::Mob_Slots.id), nullptr);
+    mob->AddProperty(kOwnId, L"A", kAAFTypeID_Int32, true, false);
+    EXPECT_TRUE(mob->IsExtended());
+    const aaf::BuiltInClass* entry = aaf::FindBuiltInClass(AUID_AAFMob);
+    ASSERT_EQ(mob->properties().size(), entry->properties.size() + 1);
+    for (std::size_t i = 0; i < entry->properties.size(); ++i) {
+        EXPECT_EQ(mob->properties()[i]->id(), entry->properties[i].key.id);
+    }
+    EXPECT_EQ(mob->properties().back()->id(), kOwnId);
+    EXPECT_FALSE(model->FindClass(AUID_AAFMasterMob)->IsExtended());
+}
+
 TEST_F(ClassDefinitions, NumbersAreAllottedFromTheTopDownwards) {
     aaf::ClassDefinition* mob = model->FindClass(AUID_AAFMob);
     EXPECT_EQ(mob->AddProperty(kOwnId, L"A", kAAFTypeID_Int32, true, false).pid(), 0xFFFF);
     EXPECT_EQ(mob->AddProperty(kOtherOwnId, L"B", kAAFTypeID_Int32, true, false).pid(), 0xFFFE);
-    const aaf::ClassDefinition* mpeg = model->FindClass(AUID_AAFMPEGVideoDescriptor);
+    aaf::ClassDefinition* mpeg = model->FindClass(AUID_AAFMPEGVideoDescriptor);
     EXPECT_EQ(mpeg->FindProperty(aaf::prop::MPEGVideoDescriptor_SingleSequence.id)->pid(), 0xFFFD);
 }
 
