@@ -75,6 +75,10 @@ const float* ChromaRows::AtLine(int component, int line) {
 }
 
 void ChromaRows::Read(int component, int line, int shift, float* to) {
+    if (shift == form_.chromaShiftX && form_.chromaShiftY == 0) {
+        reader_.Read(component, line, to);
+        return;
+    }
     const float* const from = AtLine(component, line);
     const int count = shift == 0 ? form_.width : (form_.width + 1) / 2;
     if (shift == form_.chromaShiftX) {

@@ -11,6 +11,7 @@
 #include <cmath>
 #include <cstring>
 #include <limits>
+#include <ostream>
 #include <random>
 #include <vector>
 
@@ -32,6 +33,10 @@ struct Source {
     bool isFullRange = false;
     bool isCentred = false;  // chroma, between two pixels
 };
+
+void PrintTo(const Source& source, std::ostream* out) {
+    *out << source.name;
+}
 
 const Source kSources[] = {
     {"yuv420p", AV_PIX_FMT_YUV420P},
@@ -265,8 +270,7 @@ protected:
                                           16.0 + 219.0 * model_.Yuv(x, y, layout).a};
                 for (int i = 0; i < 2; ++i) {
                     const double held = std::clamp(wanted[i] * scale, scale, 255.0 * scale - 1.0);
-                    ASSERT_NEAR(number(y, 2 * x + i), held, 0.501)
-                        << GetParam().name << " " << x << " " << y;
+                    ASSERT_NEAR(number(y, 2 * x + i), held, 0.501) << x << " " << y;
                 }
             }
         }
