@@ -79,6 +79,11 @@ private:
     void WriteFull(int line) {
         constexpr int kPart = 512;  // its numbers stay in the nearest cache
         ReadFull(line);
+        const bool isBgra = layout_ == PixelLayout::Bgra8 || layout_ == PixelLayout::BgraVideo;
+        if (isBgra && !form_.isRgb && !form_.hasAlpha) {
+            StoreOpaqueBgra(transform_.affine, rows_[0], rows_[1], rows_[2], form_.width, to_);
+            return;
+        }
         const float* const alpha = Alpha(line);
         const auto store = layout_ == PixelLayout::Argb16      ? StoreArgb16
                            : layout_ == PixelLayout::AyuvFloat ? StoreAyuvFloat

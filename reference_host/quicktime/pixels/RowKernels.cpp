@@ -129,6 +129,21 @@ void StoreBgra(const float* __restrict r, const float* __restrict g, const float
 }
 
 VECTOR_KERNEL
+void StoreOpaqueBgra(const Affine& affine, const float* __restrict y, const float* __restrict cb,
+                     const float* __restrict cr, int count, std::uint8_t* __restrict to) {
+    const Affine k = affine;
+    for (int i = 0; i < count; ++i) {
+        const float luma = k.m[0][0] * y[i];
+        const float r = luma + (k.m[0][2] * cr[i] + k.m[0][3]);
+        const float g = luma + (k.m[1][1] * cb[i] + (k.m[1][2] * cr[i] + k.m[1][3]));
+        const float b = luma + (k.m[2][1] * cb[i] + k.m[2][3]);
+        const std::uint32_t pixel = Rounded(b, 0.0f, 255.0f) | Rounded(g, 0.0f, 255.0f) << 8 |
+                                    Rounded(r, 0.0f, 255.0f) << 16 | 0xFF000000u;
+        std::memcpy(to + static_cast<std::ptrdiff_t>(i) * 4, &pixel, sizeof pixel);
+    }
+}
+
+VECTOR_KERNEL
 void StoreArgb16(const float* __restrict r, const float* __restrict g, const float* __restrict b,
                  const float* __restrict alpha, int count, std::uint8_t* __restrict to) {
     for (int i = 0; i < count; ++i) {

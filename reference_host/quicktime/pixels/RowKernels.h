@@ -35,6 +35,9 @@ void HalveChroma(const float* from, int width, float* to);
 
 void StoreBgra(const float* r, const float* g, const float* b, const float* alpha, int count,
                std::uint8_t* to);
+// From Y'CbCr at once: the matrix takes luma alike into all three.
+void StoreOpaqueBgra(const Affine& affine, const float* y, const float* cb, const float* cr,
+                     int count, std::uint8_t* to);
 void StoreArgb16(const float* r, const float* g, const float* b, const float* alpha, int count,
                  std::uint8_t* to);
 void StoreAyuvFloat(const float* y, const float* cb, const float* cr, const float* alpha, int count,
