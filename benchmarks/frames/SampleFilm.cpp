@@ -11,12 +11,12 @@
 #include "reference_host/quicktime/QuickTimeWrapper.h"
 #include "tests/support/Quoted.h"
 
-SampleFilm::SampleFilm(const std::string& codec, int frames)
+SampleFilm::SampleFilm(const std::string& codec, int frames, const std::string& size)
     : path_((std::filesystem::temp_directory_path() /
              ("bench_frames_" + std::to_string(std::random_device()()) + ".mov"))
                 .string()),
       frames_(frames),
-      works_(std::system(("ffmpeg -y -v error -f lavfi -i testsrc2=s=1920x1080:r=25 -frames:v " +
+      works_(std::system(("ffmpeg -y -v error -f lavfi -i testsrc2=s=" + size + ":r=25 -frames:v " +
                           std::to_string(frames) + " " + codec + " " + Quoted(path_))
                              .c_str()) == 0) {}
 

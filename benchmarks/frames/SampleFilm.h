@@ -7,11 +7,10 @@
 #include "host_interfaces/quicktime/QuickTimeWrapper.h"
 #include "reference_host/util/Ref.h"
 
-// A film of 1920 by 1080 that the ffmpeg command makes once and that is deleted when
-// the program ends.
+// A film that the ffmpeg command makes once and that is deleted when the program ends.
 class SampleFilm {
 public:
-    SampleFilm(const std::string& codec, int frames);
+    SampleFilm(const std::string& codec, int frames, const std::string& size = "1920x1080");
     ~SampleFilm();
     SampleFilm(const SampleFilm&) = delete;
     SampleFilm& operator=(const SampleFilm&) = delete;

@@ -75,14 +75,19 @@ const float* ChromaRows::AtLine(int component, int line) {
 }
 
 void ChromaRows::Read(int component, int line, int shift, float* to) {
+    if (shift == form_.chromaShiftX && form_.chromaShiftY == 0) {
+        reader_.Read(component, line, to);
+        return;
+    }
     const float* const from = AtLine(component, line);
     const int count = shift == 0 ? form_.width : (form_.width + 1) / 2;
     if (shift == form_.chromaShiftX) {
         std::copy_n(from, count, to);
     } else if (shift == 1 && form_.chromaShiftX == 0) {
         HalveChroma(from, form_.width, to);
-    } else if (shift == 0 && form_.chromaShiftX == 1 && form_.chromaSiteX == 0.0) {
-        DoubleCosited(from, form_.width, to);
+    } else if (shift == 0 && form_.chromaShiftX == 1) {
+        const float site = static_cast<float>(form_.chromaSiteX) * 0.5f;
+        DoubleChroma(from, site, 0.5f - site, form_.width, to);
     } else {
         Resample(from, shift, to);
     }
@@ -96,14 +101,6 @@ void ChromaRows::Resample(const float* from, int shift, float* to) const {
         const int left = std::min(static_cast<int>(std::floor(place)), width_);
         const float weight = static_cast<float>(place - left);
         to[i] = from[left] + (from[left + 1] - from[left]) * weight;
-    }
-}
-
-void HalveChroma(const float* from, int width, float* to) {
-    for (int i = 0; i < (width + 1) / 2; ++i) {
-        const float left = from[std::max(2 * i - 1, 0)];
-        const float right = from[std::min(2 * i + 1, width - 1)];
-        to[i] = (left + 2.0f * from[2 * i] + right) * 0.25f;
     }
 }
 

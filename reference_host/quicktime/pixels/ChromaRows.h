@@ -45,7 +45,4 @@ private:
     std::vector<float> blended_;
 };
 
-// Halves the width of full chroma: the mean around each even pixel.
-void HalveChroma(const float* from, int width, float* to);
-
 }  // namespace host

@@ -10,6 +10,7 @@
 #include "reference_host/quicktime/pixels/ChromaRows.h"
 #include "reference_host/quicktime/pixels/ColorTransform.h"
 #include "reference_host/quicktime/pixels/DirectPaths.h"
+#include "reference_host/quicktime/pixels/RowKernels.h"
 
 namespace host {
 namespace {
@@ -62,9 +63,8 @@ private:
     }
 
     void Transform() {
-        const float* const in[3] = {rows_[0], rows_[1], rows_[2]};
-        float* const out[3] = {rows_[3], rows_[4], rows_[5]};
-        ApplyAffine(transform_.affine, in, form_.width, out);
+        ApplyAffine(transform_.affine, rows_[0], rows_[1], rows_[2], form_.width, rows_[3],
+                    rows_[4], rows_[5]);
     }
 
     const float* Alpha(int line) {
@@ -77,20 +77,24 @@ private:
     }
 
     void WriteFull(int line) {
+        constexpr int kPart = 512;  // its numbers stay in the nearest cache
         ReadFull(line);
-        Transform();
-        const float* const out[3] = {rows_[3], rows_[4], rows_[5]};
+        const bool isBgra = layout_ == PixelLayout::Bgra8 || layout_ == PixelLayout::BgraVideo;
+        if (isBgra && !form_.isRgb && !form_.hasAlpha) {
+            StoreOpaqueBgra(transform_.affine, rows_[0], rows_[1], rows_[2], form_.width, to_);
+            return;
+        }
         const float* const alpha = Alpha(line);
-        switch (layout_) {
-            case PixelLayout::Argb16:
-                StoreArgb16(out, alpha, form_.width, to_);
-                return;
-            case PixelLayout::AyuvFloat:
-                StoreAyuvFloat(out, alpha, form_.width, to_);
-                return;
-            default:
-                StoreBgra(out, alpha, form_.width, to_);
-                return;
+        const auto store = layout_ == PixelLayout::Argb16      ? StoreArgb16
+                           : layout_ == PixelLayout::AyuvFloat ? StoreAyuvFloat
+                                                               : StoreBgra;
+        const std::size_t pixelBytes = LineBytes(layout_, 1);
+        for (int x = 0; x < form_.width; x += kPart) {
+            const int count = std::min(kPart, form_.width - x);
+            ApplyAffine(transform_.affine, rows_[0] + x, rows_[1] + x, rows_[2] + x, count,
+                        rows_[3], rows_[4], rows_[5]);
+            store(rows_[3], rows_[4], rows_[5], alpha + x, count,
+                  to_ + pixelBytes * static_cast<std::size_t>(x));
         }
     }
 
@@ -109,9 +113,18 @@ private:
         }
         ReadFull(line);
         Transform();
-        HalveChroma(rows_[4], form_.width, rows_[0]);
-        HalveChroma(rows_[5], form_.width, rows_[1]);
-        Store(rows_[3], rows_[0], rows_[1]);
+        if (form_.isRgb) {
+            HalveChroma(rows_[4], form_.width, rows_[0]);
+            HalveChroma(rows_[5], form_.width, rows_[1]);
+            Store(rows_[3], rows_[0], rows_[1]);
+            return;
+        }
+        // Chroma is made of chroma alone, so it is not widened and halved again.
+        chroma_.Read(1, line, 1, rows_[1]);
+        chroma_.Read(2, line, 1, rows_[2]);
+        ApplyAffine(transform_.affine, rows_[0], rows_[1], rows_[2], half, rows_[7], rows_[4],
+                    rows_[5]);
+        Store(rows_[3], rows_[4], rows_[5]);
     }
 
     // The codes at both ends are kept for synchronisation.

@@ -11,13 +11,16 @@
 #define VECTOR_KERNEL __attribute__((no_sanitize("thread")))
 #elif defined(__x86_64__) && defined(__GNUC__) && !defined(__clang__) && \
     !defined(__SANITIZE_ADDRESS__)
-#define VECTOR_KERNEL __attribute__((target_clones("avx2", "default")))
+#define VECTOR_KERNEL __attribute__((target_clones("arch=x86-64-v4", "avx2", "default")))
 #else
 #define VECTOR_KERNEL
 #endif
 
 namespace host {
 namespace {
+
+// A float that may stand at any address.
+using UnalignedFloat __attribute__((aligned(1), may_alias)) = float;
 
 inline float Within(float value, float least, float most) {
     const float low = value > least ? value : least;
@@ -68,14 +71,10 @@ void BlendRows(const float* __restrict a, const float* __restrict b, float weigh
 }
 
 VECTOR_KERNEL
-void ApplyAffine(const Affine& affine, const float* const in[3], int count, float* const out[3]) {
+void ApplyAffine(const Affine& affine, const float* __restrict x, const float* __restrict y,
+                 const float* __restrict z, int count, float* __restrict r, float* __restrict g,
+                 float* __restrict b) {
     const Affine k = affine;
-    const float* __restrict const x = in[0];
-    const float* __restrict const y = in[1];
-    const float* __restrict const z = in[2];
-    float* __restrict const r = out[0];
-    float* __restrict const g = out[1];
-    float* __restrict const b = out[2];
     for (int i = 0; i < count; ++i) {
         r[i] = k.m[0][0] * x[i] + k.m[0][1] * y[i] + k.m[0][2] * z[i] + k.m[0][3];
         g[i] = k.m[1][0] * x[i] + k.m[1][1] * y[i] + k.m[1][2] * z[i] + k.m[1][3];
@@ -91,22 +90,36 @@ void ScaleRow(const float* from, float scale, float offset, int count, float* to
 }
 
 VECTOR_KERNEL
-void DoubleCosited(const float* __restrict from, int count, float* __restrict to) {
+void DoubleChroma(const float* __restrict from, float before, float behind, int count,
+                  float* __restrict to) {
     for (int i = 0; i < count / 2; ++i) {
-        to[2 * i] = from[i];
-        to[2 * i + 1] = (from[i] + from[i + 1]) * 0.5f;
+        to[2 * i] = from[i] + (from[i - 1] - from[i]) * before;
+        to[2 * i + 1] = from[i] + (from[i + 1] - from[i]) * behind;
     }
     if (count % 2 != 0) {
-        to[count - 1] = from[count / 2];
+        const int last = count / 2;
+        to[count - 1] = from[last] + (from[last - 1] - from[last]) * before;
     }
 }
 
 VECTOR_KERNEL
-void StoreBgra(const float* const rgb[3], const float* __restrict alpha, int count,
-               std::uint8_t* __restrict to) {
-    const float* __restrict const r = rgb[0];
-    const float* __restrict const g = rgb[1];
-    const float* __restrict const b = rgb[2];
+void HalveChroma(const float* __restrict from, int width, float* __restrict to) {
+    const auto mean = [](float left, float middle, float right) {
+        return (left + 2.0f * middle + right) * 0.25f;
+    };
+    const int pairs = width / 2;
+    to[0] = mean(from[0], from[0], from[width > 1 ? 1 : 0]);
+    for (int i = 1; i < pairs; ++i) {
+        to[i] = mean(from[2 * i - 1], from[2 * i], from[2 * i + 1]);
+    }
+    if (width % 2 != 0 && width > 1) {
+        to[pairs] = mean(from[width - 2], from[width - 1], from[width - 1]);
+    }
+}
+
+VECTOR_KERNEL
+void StoreBgra(const float* __restrict r, const float* __restrict g, const float* __restrict b,
+               const float* __restrict alpha, int count, std::uint8_t* __restrict to) {
     for (int i = 0; i < count; ++i) {
         const std::uint32_t pixel = Rounded(b[i], 0.0f, 255.0f) | Rounded(g[i], 0.0f, 255.0f) << 8 |
                                     Rounded(r[i], 0.0f, 255.0f) << 16 |
@@ -116,11 +129,23 @@ void StoreBgra(const float* const rgb[3], const float* __restrict alpha, int cou
 }
 
 VECTOR_KERNEL
-void StoreArgb16(const float* const rgb[3], const float* __restrict alpha, int count,
-                 std::uint8_t* __restrict to) {
-    const float* __restrict const r = rgb[0];
-    const float* __restrict const g = rgb[1];
-    const float* __restrict const b = rgb[2];
+void StoreOpaqueBgra(const Affine& affine, const float* __restrict y, const float* __restrict cb,
+                     const float* __restrict cr, int count, std::uint8_t* __restrict to) {
+    const Affine k = affine;
+    for (int i = 0; i < count; ++i) {
+        const float luma = k.m[0][0] * y[i];
+        const float r = luma + (k.m[0][2] * cr[i] + k.m[0][3]);
+        const float g = luma + (k.m[1][1] * cb[i] + (k.m[1][2] * cr[i] + k.m[1][3]));
+        const float b = luma + (k.m[2][1] * cb[i] + k.m[2][3]);
+        const std::uint32_t pixel = Rounded(b, 0.0f, 255.0f) | Rounded(g, 0.0f, 255.0f) << 8 |
+                                    Rounded(r, 0.0f, 255.0f) << 16 | 0xFF000000u;
+        std::memcpy(to + static_cast<std::ptrdiff_t>(i) * 4, &pixel, sizeof pixel);
+    }
+}
+
+VECTOR_KERNEL
+void StoreArgb16(const float* __restrict r, const float* __restrict g, const float* __restrict b,
+                 const float* __restrict alpha, int count, std::uint8_t* __restrict to) {
     for (int i = 0; i < count; ++i) {
         const std::uint32_t first = Swapped16(Rounded(alpha[i], 0.0f, 65535.0f)) |
                                     Swapped16(Rounded(r[i], 0.0f, 65535.0f)) << 16;
@@ -132,14 +157,15 @@ void StoreArgb16(const float* const rgb[3], const float* __restrict alpha, int c
 }
 
 VECTOR_KERNEL
-void StoreAyuvFloat(const float* const yuv[3], const float* __restrict alpha, int count,
+void StoreAyuvFloat(const float* __restrict y, const float* __restrict cb,
+                    const float* __restrict cr, const float* __restrict alpha, int count,
                     std::uint8_t* __restrict to) {
-    const float* __restrict const y = yuv[0];
-    const float* __restrict const u = yuv[1];
-    const float* __restrict const v = yuv[2];
+    auto* const out = reinterpret_cast<UnalignedFloat*>(to);
     for (int i = 0; i < count; ++i) {
-        const float pixel[4] = {alpha[i], y[i], u[i], v[i]};
-        std::memcpy(to + static_cast<std::ptrdiff_t>(i) * 16, pixel, sizeof pixel);
+        out[4 * i] = alpha[i];
+        out[4 * i + 1] = y[i];
+        out[4 * i + 2] = cb[i];
+        out[4 * i + 3] = cr[i];
     }
 }
 

@@ -22,16 +22,26 @@ void BlendRows(const float* a, const float* b, float weight, int count, float* t
 struct Affine {
     float m[3][4];
 };
-void ApplyAffine(const Affine& affine, const float* const in[3], int count, float* const out[3]);
+void ApplyAffine(const Affine& affine, const float* x, const float* y, const float* z, int count,
+                 float* r, float* g, float* b);
 void ScaleRow(const float* from, float scale, float offset, int count, float* to);
 
-// Chroma of twice the width, when its samples stand on even pixels. `from` has
-// one number more than needed.
-void DoubleCosited(const float* from, int count, float* to);
+// Chroma of twice the width: each stored number makes two, the first with `before` of the
+// number before it, the second with `behind` of the number behind it. `from` has one number
+// more at both ends.
+void DoubleChroma(const float* from, float before, float behind, int count, float* to);
+// Chroma of half the width: the mean around each even pixel.
+void HalveChroma(const float* from, int width, float* to);
 
-void StoreBgra(const float* const rgb[3], const float* alpha, int count, std::uint8_t* to);
-void StoreArgb16(const float* const rgb[3], const float* alpha, int count, std::uint8_t* to);
-void StoreAyuvFloat(const float* const yuv[3], const float* alpha, int count, std::uint8_t* to);
+void StoreBgra(const float* r, const float* g, const float* b, const float* alpha, int count,
+               std::uint8_t* to);
+// From Y'CbCr at once: the matrix takes luma alike into all three.
+void StoreOpaqueBgra(const Affine& affine, const float* y, const float* cb, const float* cr,
+                     int count, std::uint8_t* to);
+void StoreArgb16(const float* r, const float* g, const float* b, const float* alpha, int count,
+                 std::uint8_t* to);
+void StoreAyuvFloat(const float* y, const float* cb, const float* cr, const float* alpha, int count,
+                    std::uint8_t* to);
 // Numbers are held within the range of `least` to `most`.
 void StoreUyvy(const float* luma, const float* cb, const float* cr, int count, float least,
                float most, std::uint8_t* to);

@@ -60,7 +60,8 @@ void RowReader::Read(int component, int line, float* to) const {
         for (int x = 0; x < width; ++x) {
             float value = 0.0f;
             std::memcpy(&value, row + static_cast<std::ptrdiff_t>(x) * part.step, sizeof value);
-            to[x] = std::min(std::max(value, 0.0f), 1.0f) * 65535.0f;
+            // What is no number counts as 0.
+            to[x] = value > 0.0f ? std::min(value, 1.0f) * 65535.0f : 0.0f;
         }
     } else if (part.depth == 8 && part.shift == 0) {
         part.step == 1 ? WidenBytes(row, width, to) : WidenStridedBytes(row, part.step, width, to);

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "reference_host/quicktime/pixels/ChromaRows.h"
+#include "reference_host/quicktime/pixels/RowKernels.h"
 
 namespace {
 
