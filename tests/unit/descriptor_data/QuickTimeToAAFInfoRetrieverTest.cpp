@@ -281,4 +281,13 @@ TEST_F(RetrieverTest, TheRecordMayBeLeftOut) {
               NCF_E_INVALIDARG);
 }
 
+TEST_F(RetrieverTest, WithoutAPictureNothingIsAnswered) {
+    EXPECT_EQ(Init(Entry("1", "MPEG2Video", Join(MPEG2Values()))), NCF_OK);
+    id_ = 7;
+    EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance()->GetInfoFromImageDescription(
+                  nullptr, nullptr, &id_),
+              NCF_E_INVALIDARG);
+    EXPECT_EQ(id_, 7u);
+}
+
 }  // namespace
