@@ -14,31 +14,31 @@ namespace {
 constexpr std::size_t kLongestNameBytes = 64;  // with the terminator
 
 std::uint32_t NumberIn(const std::uint8_t* bytes) {
-    return ByteReader(bytes, 4).number<std::uint32_t>();
+    return ByteReader(bytes, 4).TakeNumber<std::uint32_t>();
 }
 
 CompoundFileReader::Entry ParseEntry(const std::uint8_t* bytes) {
     CompoundFileReader::Entry entry;
     ByteReader from(bytes, kDirectoryEntrySize);
-    const Bytes units = from.bytes(kLongestNameBytes);
-    const auto length = from.number<std::uint16_t>();
-    entry.kind = CompoundFileReader::Kind(from.number<std::uint8_t>());
+    const Bytes units = from.TakeBytes(kLongestNameBytes);
+    const auto length = from.TakeNumber<std::uint16_t>();
+    entry.kind = CompoundFileReader::Kind(from.TakeNumber<std::uint8_t>());
     if (entry.kind == CompoundFileReader::Kind::Unused) {
         return entry;
     }
     if (length < 4 || length > kLongestNameBytes || length % 2 != 0) {
         throw StoredError("a directory entry with a name of " + std::to_string(length) + " bytes");
     }
-    entry.name = ByteReader(units.data(), length).text();
-    from.number<std::uint8_t>();  // the colour in the search tree, which nobody needs
-    entry.left = from.number<std::uint32_t>();
-    entry.right = from.number<std::uint32_t>();
-    entry.child = from.number<std::uint32_t>();
-    const Bytes classId = from.bytes(entry.classId.size());
+    entry.name = ByteReader(units.data(), length).TakeText();
+    from.TakeNumber<std::uint8_t>();  // the colour in the search tree, which nobody needs
+    entry.left = from.TakeNumber<std::uint32_t>();
+    entry.right = from.TakeNumber<std::uint32_t>();
+    entry.child = from.TakeNumber<std::uint32_t>();
+    const Bytes classId = from.TakeBytes(entry.classId.size());
     std::copy(classId.begin(), classId.end(), entry.classId.begin());
     from.bytes(4 + 8 + 8);  // user flags and times
-    entry.start = from.number<std::uint32_t>();
-    entry.size = from.number<std::uint64_t>();
+    entry.start = from.TakeNumber<std::uint32_t>();
+    entry.size = from.TakeNumber<std::uint64_t>();
     return entry;
 }
 
@@ -58,9 +58,9 @@ void CompoundFileReader::ReadHeader() {
     }
     std::copy_n(file_.begin() + kSignatureOffset, signature_.size(), signature_.begin());
     ByteReader from(file_.data() + kSectorShiftOffset - 2, 6);
-    const auto order = from.number<std::uint16_t>();
-    const auto shift = from.number<std::uint16_t>();
-    const auto smallShift = from.number<std::uint16_t>();
+    const auto order = from.TakeNumber<std::uint16_t>();
+    const auto shift = from.TakeNumber<std::uint16_t>();
+    const auto smallShift = from.TakeNumber<std::uint16_t>();
     if (order != 0xFFFE || (shift != 9 && shift != 12) ||
         1u << smallShift % 32 != kSmallSectorSize ||
         HeaderNumber(kSmallLimitOffset) != kSmallStreamLimit) {

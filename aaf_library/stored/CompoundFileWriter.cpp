@@ -26,7 +26,7 @@ std::string CheckedName(const std::u16string& name) {
 }
 
 std::uint32_t NumberAt(const Bytes& file, std::size_t offset) {
-    return ByteReader(file.data() + offset, 4).number<std::uint32_t>();
+    return ByteReader(file.data() + offset, 4).TakeNumber<std::uint32_t>();
 }
 
 // In a large file with large sectors libgsf can name an allocation table

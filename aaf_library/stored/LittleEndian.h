@@ -14,7 +14,7 @@ namespace aaf::stored {
 class ByteWriter {
 public:
     template <typename Number>
-    ByteWriter& number(Number value) {
+    ByteWriter& AppendNumber(Number value) {
         for (std::size_t i = 0; i < sizeof(Number); ++i) {
             bytes_.push_back(static_cast<std::uint8_t>(static_cast<std::uint64_t>(value) >> 8 * i));
         }
@@ -26,11 +26,11 @@ public:
         return *this;
     }
     // A text with its terminator.
-    ByteWriter& text(const std::u16string& text) {
+    ByteWriter& AppendText(const std::u16string& text) {
         for (char16_t unit : text) {
-            number(static_cast<std::uint16_t>(unit));
+            AppendNumber(static_cast<std::uint16_t>(unit));
         }
-        return number(std::uint16_t{0});
+        return AppendNumber(std::uint16_t{0});
     }
 
     const Bytes& bytes() const { return bytes_; }
@@ -47,7 +47,7 @@ public:
     explicit ByteReader(const Bytes& bytes) : ByteReader(bytes.data(), bytes.size()) {}
 
     template <typename Number>
-    Number number() {
+    Number TakeNumber() {
         const std::uint8_t* from = Take(sizeof(Number));
         std::uint64_t value = 0;
         for (std::size_t i = 0; i < sizeof(Number); ++i) {
@@ -55,20 +55,20 @@ public:
         }
         return static_cast<Number>(value);
     }
-    Bytes bytes(std::size_t size) {
+    Bytes TakeBytes(std::size_t size) {
         const std::uint8_t* from = Take(size);
         return Bytes(from, from + size);
     }
     // The rest as a text, which must end with its only terminator.
-    std::u16string text() {
+    std::u16string TakeText() {
         if (left_ < 2 || left_ % 2 != 0) {
             throw StoredError("a name of " + std::to_string(left_) + " bytes");
         }
         std::u16string text;
         while (left_ > 2) {
-            text += static_cast<char16_t>(number<std::uint16_t>());
+            text += static_cast<char16_t>(TakeNumber<std::uint16_t>());
         }
-        if (number<std::uint16_t>() != 0 || text.find(u'\0') != std::u16string::npos) {
+        if (TakeNumber<std::uint16_t>() != 0 || text.find(u'\0') != std::u16string::npos) {
             throw StoredError("a name that does not end with its terminator");
         }
         return text;

@@ -10,13 +10,13 @@ namespace aaf::stored {
 
 namespace {
 
-const StoredProperty* find(const StoredObject& object, std::uint16_t pid, StoredForm form) {
+const StoredProperty* FindIn(const StoredObject& object, std::uint16_t pid, StoredForm form) {
     const StoredProperty* property = object.Find(pid);
     return property != nullptr && property->form == form ? property : nullptr;
 }
 
 const Bytes& RequiredData(const StoredObject& object, std::uint16_t pid) {
-    const StoredProperty* property = find(object, pid, StoredForm::Data);
+    const StoredProperty* property = FindIn(object, pid, StoredForm::Data);
     if (property == nullptr) {
         throw StoredError(PropertyText(pid) + " is missing");
     }
@@ -24,7 +24,7 @@ const Bytes& RequiredData(const StoredObject& object, std::uint16_t pid) {
 }
 
 const StoredProperty& RequiredSet(const StoredObject& object, std::uint16_t pid) {
-    const StoredProperty* property = find(object, pid, StoredForm::StrongSet);
+    const StoredProperty* property = FindIn(object, pid, StoredForm::StrongSet);
     if (property == nullptr) {
         throw StoredError(PropertyText(pid) + " is missing");
     }
@@ -33,20 +33,20 @@ const StoredProperty& RequiredSet(const StoredObject& object, std::uint16_t pid)
 
 template <typename Number>
 Number RequiredNumber(const StoredObject& object, std::uint16_t pid) {
-    return ByteReader(RequiredData(object, pid)).number<Number>();
+    return ByteReader(RequiredData(object, pid)).TakeNumber<Number>();
 }
 
-bool flag(const StoredObject& object, std::uint16_t pid, bool absent) {
-    const StoredProperty* property = find(object, pid, StoredForm::Data);
+bool FlagOf(const StoredObject& object, std::uint16_t pid, bool absent) {
+    const StoredProperty* property = FindIn(object, pid, StoredForm::Data);
     return property == nullptr ? absent : property->bytes.front() != 0;
 }
 
 std::wstring NameOf(const StoredObject& object) {
-    return WideOf(ByteReader(RequiredData(object, meta::kName)).text());
+    return WideOf(ByteReader(RequiredData(object, meta::kName)).TakeText());
 }
 
 GUID RequiredTarget(const StoredObject& object, std::uint16_t pid) {
-    const StoredProperty* property = find(object, pid, StoredForm::WeakReference);
+    const StoredProperty* property = FindIn(object, pid, StoredForm::WeakReference);
     if (property == nullptr) {
         throw StoredError(PropertyText(pid) + " is missing");
     }
@@ -54,16 +54,16 @@ GUID RequiredTarget(const StoredObject& object, std::uint16_t pid) {
 }
 
 // Names one after the other, each with its terminator. Absent: none.
-std::vector<std::wstring> names(const StoredObject& object, std::uint16_t pid) {
+std::vector<std::wstring> NamesIn(const StoredObject& object, std::uint16_t pid) {
     std::vector<std::wstring> out;
-    const StoredProperty* property = find(object, pid, StoredForm::Data);
+    const StoredProperty* property = FindIn(object, pid, StoredForm::Data);
     if (property == nullptr) {
         return out;
     }
     ByteReader from(property->bytes);
     std::u16string name;
     while (from.left() != 0) {
-        const auto unit = static_cast<char16_t>(from.number<std::uint16_t>());
+        const auto unit = static_cast<char16_t>(from.TakeNumber<std::uint16_t>());
         if (unit != 0) {
             name += unit;
             continue;
@@ -77,20 +77,20 @@ std::vector<std::wstring> names(const StoredObject& object, std::uint16_t pid) {
     return out;
 }
 
-std::vector<GUID> ids(const StoredObject& object, std::uint16_t pid) {
+std::vector<GUID> IdsIn(const StoredObject& object, std::uint16_t pid) {
     std::vector<GUID> out;
-    const StoredProperty* property = find(object, pid, StoredForm::Data);
+    const StoredProperty* property = FindIn(object, pid, StoredForm::Data);
     if (property == nullptr) {
         return out;
     }
     ByteReader from(property->bytes);
     while (from.left() != 0) {
-        out.push_back(GuidOf(from.bytes(sizeof(StoredAuid))));
+        out.push_back(GuidOf(from.TakeBytes(sizeof(StoredAuid))));
     }
     return out;
 }
 
-std::vector<TypeMember> named(std::vector<std::wstring> memberNames, std::size_t values) {
+std::vector<TypeMember> Named(std::vector<std::wstring> memberNames, std::size_t values) {
     if (memberNames.size() != values) {
         throw StoredError(std::to_string(memberNames.size()) + " names for " +
                           std::to_string(values) + " members");
@@ -104,7 +104,7 @@ std::vector<TypeMember> named(std::vector<std::wstring> memberNames, std::size_t
 
 std::vector<TypeMember> WithIds(std::vector<std::wstring> memberNames,
                                 const std::vector<GUID>& values) {
-    std::vector<TypeMember> members = named(std::move(memberNames), values.size());
+    std::vector<TypeMember> members = Named(std::move(memberNames), values.size());
     for (std::size_t i = 0; i < values.size(); ++i) {
         members[i].id = values[i];
     }
@@ -112,15 +112,15 @@ std::vector<TypeMember> WithIds(std::vector<std::wstring> memberNames,
 }
 
 std::vector<TypeMember> EnumerationMembers(const StoredObject& object) {
-    std::vector<std::wstring> memberNames = names(object, meta::kEnumerationNames);
+    std::vector<std::wstring> memberNames = NamesIn(object, meta::kEnumerationNames);
     std::vector<std::int64_t> values;
-    if (const StoredProperty* stored = find(object, meta::kEnumerationValues, StoredForm::Data)) {
+    if (const StoredProperty* stored = FindIn(object, meta::kEnumerationValues, StoredForm::Data)) {
         ByteReader from(stored->bytes);
         while (from.left() != 0) {
-            values.push_back(from.number<std::int64_t>());
+            values.push_back(from.TakeNumber<std::int64_t>());
         }
     }
-    std::vector<TypeMember> members = named(std::move(memberNames), values.size());
+    std::vector<TypeMember> members = Named(std::move(memberNames), values.size());
     for (std::size_t i = 0; i < values.size(); ++i) {
         members[i].value = values[i];
     }
@@ -130,22 +130,22 @@ std::vector<TypeMember> EnumerationMembers(const StoredObject& object) {
 std::vector<TypeMember> RecordMembers(const StoredObject& object) {
     std::vector<GUID> types;
     if (const StoredProperty* stored =
-            find(object, meta::kRecordMemberTypes, StoredForm::WeakVector)) {
+            FindIn(object, meta::kRecordMemberTypes, StoredForm::WeakVector)) {
         for (const Bytes& key : stored->keys) {
             types.push_back(GuidOf(key));
         }
     }
-    return WithIds(names(object, meta::kRecordMemberNames), types);
+    return WithIds(NamesIn(object, meta::kRecordMemberNames), types);
 }
 
 void ReadMembers(const StoredObject& object, TypeFacts& record) {
     switch (record.kind) {
         case TypeKind::Integer:
             record.size = RequiredNumber<std::uint8_t>(object, meta::kIntegerSize);
-            record.isSigned = flag(object, meta::kIntegerIsSigned, false);
+            record.isSigned = FlagOf(object, meta::kIntegerIsSigned, false);
             break;
         case TypeKind::WeakReference: {
-            const std::vector<GUID> path = ids(object, meta::kWeakTargetSet);
+            const std::vector<GUID> path = IdsIn(object, meta::kWeakTargetSet);
             record.members = WithIds(std::vector<std::wstring>(path.size()), path);
             break;
         }
@@ -159,8 +159,8 @@ void ReadMembers(const StoredObject& object, TypeFacts& record) {
             record.members = RecordMembers(object);
             break;
         case TypeKind::ExtendibleEnumeration:
-            record.members = WithIds(names(object, meta::kExtendibleNames),
-                                     ids(object, meta::kExtendibleValues));
+            record.members = WithIds(NamesIn(object, meta::kExtendibleNames),
+                                     IdsIn(object, meta::kExtendibleValues));
             break;
         default:
             break;
@@ -172,9 +172,9 @@ MetaProperty ReadProperty(const StoredObject& object) {
     record.id = GuidOf(RequiredData(object, meta::kIdentification));
     record.name = NameOf(object);
     record.type = GuidOf(RequiredData(object, meta::kPropertyType));
-    record.optional = flag(object, meta::kIsOptional, true);
+    record.optional = FlagOf(object, meta::kIsOptional, true);
     record.pid = RequiredNumber<std::uint16_t>(object, meta::kLocalIdentification);
-    record.unique = flag(object, meta::kIsUniqueIdentifier, false);
+    record.unique = FlagOf(object, meta::kIsUniqueIdentifier, false);
     return record;
 }
 
@@ -183,8 +183,8 @@ MetaClass ReadClass(const StoredObject& object) {
     record.id = GuidOf(RequiredData(object, meta::kIdentification));
     record.name = NameOf(object);
     record.parent = RequiredTarget(object, meta::kParentClass);
-    record.concrete = flag(object, meta::kIsConcrete, true);
-    if (const StoredProperty* set = find(object, meta::kProperties, StoredForm::StrongSet)) {
+    record.concrete = FlagOf(object, meta::kIsConcrete, true);
+    if (const StoredProperty* set = FindIn(object, meta::kProperties, StoredForm::StrongSet)) {
         for (const StoredObject& property : set->objects) {
             record.properties.push_back(ReadProperty(property));
         }

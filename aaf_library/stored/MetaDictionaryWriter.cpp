@@ -21,24 +21,24 @@ class Definition {
 public:
     Definition(const GUID& definitionClass, const GUID& id, const std::wstring& name) {
         object_.classId = AuidOf(definitionClass);
-        data(meta::kIdentification, IdBytes(id));
-        data(meta::kName, ByteWriter().text(Utf16Of(name)).bytes());
+        AddData(meta::kIdentification, IdBytes(id));
+        AddData(meta::kName, ByteWriter().AppendText(Utf16Of(name)).bytes());
     }
 
-    void data(std::uint16_t pid, Bytes value) {
+    void AddData(std::uint16_t pid, Bytes value) {
         StoredProperty property;
         property.pid = pid;
         property.bytes = std::move(value);
         object_.properties.push_back(std::move(property));
     }
     template <typename Number>
-    void number(std::uint16_t pid, Number value) {
-        data(pid, ByteWriter().number(value).bytes());
+    void AddNumber(std::uint16_t pid, Number value) {
+        AddData(pid, ByteWriter().AppendNumber(value).bytes());
     }
-    void flag(std::uint16_t pid, bool value) { number(pid, std::uint8_t{value}); }
+    void AddFlag(std::uint16_t pid, bool value) { AddNumber(pid, std::uint8_t{value}); }
 
-    void weak(std::uint16_t pid, StoredForm form, const std::u16string& name,
-              std::vector<Bytes> keys, const std::vector<std::uint16_t>& path) {
+    void AddWeak(std::uint16_t pid, StoredForm form, const std::u16string& name,
+                 std::vector<Bytes> keys, const std::vector<std::uint16_t>& path) {
         StoredProperty property;
         property.pid = pid;
         property.form = form;
@@ -48,11 +48,11 @@ public:
         property.targetPath = path;
         object_.properties.push_back(std::move(property));
     }
-    void weak(std::uint16_t pid, const GUID& target, const std::vector<std::uint16_t>& path) {
-        weak(pid, StoredForm::WeakReference, {}, {IdBytes(target)}, path);
+    void AddWeak(std::uint16_t pid, const GUID& target, const std::vector<std::uint16_t>& path) {
+        AddWeak(pid, StoredForm::WeakReference, {}, {IdBytes(target)}, path);
     }
 
-    void set(StoredProperty property) { object_.properties.push_back(std::move(property)); }
+    void AddSet(StoredProperty property) { object_.properties.push_back(std::move(property)); }
 
     StoredObject Take() { return std::move(object_); }
 
@@ -76,33 +76,33 @@ void AddTo(StoredProperty& set, const GUID& id, StoredObject definition) {
 
 StoredObject StoredPropertyDefinition(const MetaProperty& record) {
     Definition definition(AUID_AAFPropertyDef, record.id, record.name);
-    definition.data(meta::kPropertyType, IdBytes(record.type));  // an id, no weak reference
-    definition.flag(meta::kIsOptional, record.optional);
-    definition.number(meta::kLocalIdentification, record.pid);
+    definition.AddData(meta::kPropertyType, IdBytes(record.type));  // an id, no weak reference
+    definition.AddFlag(meta::kIsOptional, record.optional);
+    definition.AddNumber(meta::kLocalIdentification, record.pid);
     if (record.unique) {
-        definition.flag(meta::kIsUniqueIdentifier, true);
+        definition.AddFlag(meta::kIsUniqueIdentifier, true);
     }
     return definition.Take();
 }
 
 StoredObject StoredClass(const MetaClass& record) {
     Definition definition(AUID_AAFClassDef, record.id, record.name);
-    definition.weak(meta::kParentClass, record.parent, kClassPath);
+    definition.AddWeak(meta::kParentClass, record.parent, kClassPath);
     if (!record.properties.empty()) {
         StoredProperty properties = DefinitionSet(meta::kProperties, u"Properties");
         for (const MetaProperty& property : record.properties) {
             AddTo(properties, property.id, StoredPropertyDefinition(property));
         }
-        definition.set(std::move(properties));
+        definition.AddSet(std::move(properties));
     }
-    definition.flag(meta::kIsConcrete, record.concrete);
+    definition.AddFlag(meta::kIsConcrete, record.concrete);
     return definition.Take();
 }
 
 Bytes MemberNames(const TypeFacts& record) {
     ByteWriter names;
     for (const TypeMember& member : record.members) {
-        names.text(Utf16Of(member.name));
+        names.AppendText(Utf16Of(member.name));
     }
     return names.bytes();
 }
@@ -118,7 +118,7 @@ Bytes MemberIds(const TypeFacts& record) {
 Bytes MemberValues(const TypeFacts& record) {
     ByteWriter values;
     for (const TypeMember& member : record.members) {
-        values.number(member.value);
+        values.AppendNumber(member.value);
     }
     return values.bytes();
 }
@@ -128,37 +128,37 @@ void AddRecordMembers(Definition& definition, const TypeFacts& record) {
     for (const TypeMember& member : record.members) {
         types.push_back(IdBytes(member.id));
     }
-    definition.weak(meta::kRecordMemberTypes, StoredForm::WeakVector, u"MemberTypes",
-                    std::move(types), kTypePath);
-    definition.data(meta::kRecordMemberNames, MemberNames(record));
+    definition.AddWeak(meta::kRecordMemberTypes, StoredForm::WeakVector, u"MemberTypes",
+                       std::move(types), kTypePath);
+    definition.AddData(meta::kRecordMemberNames, MemberNames(record));
 }
 
 StoredObject StoredType(const TypeFacts& record) {
     Definition definition(ClassOfTypes(record.kind), record.id, record.name);
     if (const std::uint16_t pid = TargetPidOf(record.kind); pid != 0) {
-        definition.weak(pid, record.target, RefersToClass(record.kind) ? kClassPath : kTypePath);
+        definition.AddWeak(pid, record.target, RefersToClass(record.kind) ? kClassPath : kTypePath);
     }
     switch (record.kind) {
         case TypeKind::Integer:
-            definition.number(meta::kIntegerSize, static_cast<std::uint8_t>(record.size));
-            definition.flag(meta::kIntegerIsSigned, record.isSigned);
+            definition.AddNumber(meta::kIntegerSize, static_cast<std::uint8_t>(record.size));
+            definition.AddFlag(meta::kIntegerIsSigned, record.isSigned);
             break;
         case TypeKind::WeakReference:
-            definition.data(meta::kWeakTargetSet, MemberIds(record));
+            definition.AddData(meta::kWeakTargetSet, MemberIds(record));
             break;
         case TypeKind::Enumeration:
-            definition.data(meta::kEnumerationNames, MemberNames(record));
-            definition.data(meta::kEnumerationValues, MemberValues(record));
+            definition.AddData(meta::kEnumerationNames, MemberNames(record));
+            definition.AddData(meta::kEnumerationValues, MemberValues(record));
             break;
         case TypeKind::FixedArray:
-            definition.number(meta::kFixedArrayCount, record.size);
+            definition.AddNumber(meta::kFixedArrayCount, record.size);
             break;
         case TypeKind::Record:
             AddRecordMembers(definition, record);
             break;
         case TypeKind::ExtendibleEnumeration:
-            definition.data(meta::kExtendibleNames, MemberNames(record));
-            definition.data(meta::kExtendibleValues, MemberIds(record));
+            definition.AddData(meta::kExtendibleNames, MemberNames(record));
+            definition.AddData(meta::kExtendibleValues, MemberIds(record));
             break;
         default:
             break;  // the others are told by their target alone

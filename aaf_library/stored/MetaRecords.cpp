@@ -34,9 +34,9 @@ std::uint16_t TargetPidOf(TypeKind kind) {
 
 StoredAuid AuidOf(const GUID& id) {
     const Bytes bytes = ByteWriter()
-                            .number(static_cast<std::uint32_t>(id.Data1))
-                            .number(static_cast<std::uint16_t>(id.Data2))
-                            .number(static_cast<std::uint16_t>(id.Data3))
+                            .AppendNumber(static_cast<std::uint32_t>(id.Data1))
+                            .AppendNumber(static_cast<std::uint16_t>(id.Data2))
+                            .AppendNumber(static_cast<std::uint16_t>(id.Data3))
                             .bytes();
     StoredAuid out;
     std::copy(bytes.begin(), bytes.end(), out.begin());
@@ -47,9 +47,9 @@ StoredAuid AuidOf(const GUID& id) {
 GUID GuidOf(const StoredAuid& id) {
     ByteReader from(id.data(), id.size());
     GUID out{};
-    out.Data1 = from.number<std::uint32_t>();
-    out.Data2 = from.number<std::uint16_t>();
-    out.Data3 = from.number<std::uint16_t>();
+    out.Data1 = from.TakeNumber<std::uint32_t>();
+    out.Data2 = from.TakeNumber<std::uint16_t>();
+    out.Data3 = from.TakeNumber<std::uint16_t>();
     std::copy(id.begin() + 8, id.end(), std::begin(out.Data4));
     return out;
 }

@@ -14,7 +14,7 @@ std::u16string Utf16Of(const std::wstring& text) {
     ByteReader from(stored);
     std::u16string out;
     while (from.left() != 0) {
-        out += static_cast<char16_t>(from.number<std::uint16_t>());
+        out += static_cast<char16_t>(from.TakeNumber<std::uint16_t>());
     }
     return out;
 }
@@ -22,7 +22,7 @@ std::u16string Utf16Of(const std::wstring& text) {
 std::wstring WideOf(const std::u16string& text) {
     ByteWriter stored;
     for (char16_t unit : text) {
-        stored.number(static_cast<std::uint16_t>(unit));
+        stored.AppendNumber(static_cast<std::uint16_t>(unit));
     }
     return FromUtf16(stored.bytes().data(), stored.bytes().size());
 }

@@ -18,7 +18,7 @@ namespace aaf::stored {
 
 namespace {
 
-const StoredObject& contained(const StoredObject& holder, std::uint16_t pid, const char* what) {
+const StoredObject& ContainedIn(const StoredObject& holder, std::uint16_t pid, const char* what) {
     const StoredProperty* property = holder.Find(pid);
     if (property == nullptr || property->form != StoredForm::StrongReference) {
         throw StoredError(std::string("has no ") + what);
@@ -31,8 +31,8 @@ public:
     ModelReader(const MetaRecords& records, Model& model)
         : model_(model), definitions_(records, model) {}
 
-    RefPtr<Object> header(const StoredObject& from) {
-        MergeDictionary(contained(from, prop::Header_Dictionary.pid, "dictionary"));
+    RefPtr<Object> ReadHeader(const StoredObject& from) {
+        MergeDictionary(ContainedIn(from, prop::Header_Dictionary.pid, "dictionary"));
         RefPtr<Object> header = NewObject(from, AUID_AAFHeader);
         Fill(*header, from, prop::Header_Dictionary.id);
         header->PutObject(prop::Header_Dictionary, model_.dictionary().Identity());
@@ -98,7 +98,7 @@ private:
             case StoredForm::WeakReference:
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                value->BytesToChange() = targets(from);
+                value->BytesToChange() = TargetsOf(from);
                 break;
             case StoredForm::StrongReference:
             case StoredForm::StrongVector:
@@ -124,7 +124,7 @@ private:
         }
     }
 
-    static Bytes targets(const StoredProperty& from) {
+    static Bytes TargetsOf(const StoredProperty& from) {
         Bytes ids;
         for (const Bytes& key : from.keys) {
             if (key.size() != sizeof(StoredAuid)) {
@@ -205,10 +205,10 @@ private:
 
 RefPtr<Object> ReadModel(const StoredObject& root, Model& model) {
     const MetaRecords records =
-        ReadMetaDictionary(contained(root, meta::kRootMetaDictionary, "meta-dictionary"));
-    const StoredObject& header = contained(root, meta::kRootHeader, "header");
+        ReadMetaDictionary(ContainedIn(root, meta::kRootMetaDictionary, "meta-dictionary"));
+    const StoredObject& header = ContainedIn(root, meta::kRootHeader, "header");
     ModelReader reader(records, model);
-    return reader.header(header);
+    return reader.ReadHeader(header);
 }
 
 }  // namespace aaf::stored

@@ -50,24 +50,25 @@ public:
     explicit ModelWriter(Model& model) : model_(model), closure_(model) {}
 
     StoredObject Write(Object& header) {
-        StoredObject storedHeader = object(header, prop::Header_Dictionary.pid);
-        storedHeader.properties.push_back(
-            reference(prop::Header_Dictionary.pid, u"Dictionary", dictionary(model_.dictionary())));
+        StoredObject storedHeader = StoredObjectOf(header, prop::Header_Dictionary.pid);
+        storedHeader.properties.push_back(ReferenceTo(prop::Header_Dictionary.pid, u"Dictionary",
+                                                      StoredDictionary(model_.dictionary())));
         SortByPid(storedHeader);
 
         closure_.AddMetaClasses();
         closure_.AddExtensions();
         StoredObject root;
         root.classId = kRootClassId;
-        root.properties.push_back(reference(meta::kRootMetaDictionary, u"MetaDictionary",
-                                            StoredMetaDictionary(closure_.records())));
-        root.properties.push_back(reference(meta::kRootHeader, u"Header", std::move(storedHeader)));
+        root.properties.push_back(ReferenceTo(meta::kRootMetaDictionary, u"MetaDictionary",
+                                              StoredMetaDictionary(closure_.records())));
+        root.properties.push_back(
+            ReferenceTo(meta::kRootHeader, u"Header", std::move(storedHeader)));
         return root;
     }
 
 private:
-    static StoredProperty reference(std::uint16_t pid, const std::u16string& name,
-                                    StoredObject object) {
+    static StoredProperty ReferenceTo(std::uint16_t pid, const std::u16string& name,
+                                      StoredObject object) {
         StoredProperty property;
         property.pid = pid;
         property.form = StoredForm::StrongReference;
@@ -77,13 +78,13 @@ private:
     }
 
     // All properties of the object but the one that is left out.
-    StoredObject object(const Object& from, PropertyId leftOut = kNoPropertyId) {
+    StoredObject StoredObjectOf(const Object& from, PropertyId leftOut = kNoPropertyId) {
         StoredObject out;
         out.classId = AuidOf(from.classId());
         closure_.AddClass(from.classId());
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
-                out.properties.push_back(property(from, entry.first, *entry.second));
+                out.properties.push_back(StoredPropertyOf(from, entry.first, *entry.second));
             }
         }
         AddRequired(from, out, leftOut);
@@ -91,19 +92,20 @@ private:
         return out;
     }
 
-    StoredProperty property(const Object& from, PropertyId pid, const PropertyValue& value) {
+    StoredProperty StoredPropertyOf(const Object& from, PropertyId pid,
+                                    const PropertyValue& value) {
         const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
         if (definition == nullptr || definition->type() == nullptr) {
             throw StoredError(PropertyText(pid) + " has no definition");
         }
         StoredProperty out = EmptyProperty(*definition);
         if (StoredFormOf(value.type()) != out.form) {
-            throw StoredError(text(*definition) + " holds a value of another form than its type");
+            throw StoredError(TextOf(*definition) + " holds a value of another form than its type");
         }
         try {
             Fill(out, *definition, value);
         } catch (const StoredError& problem) {
-            throw StoredError(text(*definition) + ": " + problem.what());
+            throw StoredError(TextOf(*definition) + ": " + problem.what());
         }
         return out;
     }
@@ -122,7 +124,7 @@ private:
             case StoredForm::StrongVector:
             case StoredForm::StrongSet:
                 for (const RefPtr<Object>& contained : value.objects()) {
-                    out.objects.push_back(object(*contained));
+                    out.objects.push_back(StoredObjectOf(*contained));
                     if (out.form == StoredForm::StrongSet) {
                         out.keys.push_back(contained->UniqueKey());
                     }
@@ -253,7 +255,7 @@ private:
     // Of the definitions that every model has from the start only those are
     // stored that something refers to. A definition may refer to others, so
     // the sets are gone through until nothing is added.
-    StoredObject dictionary(const Object& from) {
+    StoredObject StoredDictionary(const Object& from) {
         StoredObject out;
         out.classId = AuidOf(from.classId());
         closure_.AddClass(from.classId());
@@ -263,7 +265,7 @@ private:
                 sets[entry.first] =
                     EmptyProperty(*from.classDefinition().FindProperty(entry.first));
             } else {
-                out.properties.push_back(property(from, entry.first, *entry.second));
+                out.properties.push_back(StoredPropertyOf(from, entry.first, *entry.second));
             }
         }
         std::set<const Object*> stored;
@@ -292,7 +294,7 @@ private:
             const bool wanted = !IsBuiltInDefinition(key) || targets_[path].count(key) != 0;
             if (wanted && stored.insert(definition.get()).second) {
                 set.keys.push_back(key);
-                set.objects.push_back(object(*definition));
+                set.objects.push_back(StoredObjectOf(*definition));
             }
         }
     }
@@ -316,7 +318,7 @@ private:
         }
     }
 
-    static std::string text(const PropertyDefinition& definition) {
+    static std::string TextOf(const PropertyDefinition& definition) {
         return ToUtf8(definition.name());
     }
 

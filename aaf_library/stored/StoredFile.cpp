@@ -21,7 +21,7 @@ const StoredAuid kRootClassId = {0xA5, 0x98, 0xB3, 0xB3, 0x90, 0x1C, 0xD4, 0x11,
 
 namespace {
 
-FileResult failed(FileFailure failure, const std::filesystem::path& path, const std::string& what) {
+FileResult Failed(FileFailure failure, const std::filesystem::path& path, const std::string& what) {
     return {failure, path.u8string() + ": " + what};
 }
 
@@ -33,7 +33,7 @@ FileResult SystemFailure(const std::filesystem::path& path, const std::string& w
     if (reason != 0) {
         text += ": " + std::generic_category().message(reason);
     }
-    return failed(failure, path, text);
+    return Failed(failure, path, text);
 }
 
 // Removes the half-written file unless it was put in place.
@@ -84,7 +84,7 @@ FileResult ReplaceFile(const Bytes& bytes, const std::filesystem::path& path) {
         return SystemFailure(path, "cannot be written");
     }
     if (const std::error_code problem = temporary.MoveTo(path)) {
-        return failed(FileFailure::NoAccess, path, "cannot be replaced: " + problem.message());
+        return Failed(FileFailure::NoAccess, path, "cannot be replaced: " + problem.message());
     }
     return {};
 }
@@ -92,7 +92,7 @@ FileResult ReplaceFile(const Bytes& bytes, const std::filesystem::path& path) {
 FileResult ReadFile(const std::filesystem::path& path, Bytes& bytes) {
     std::error_code problem;
     if (std::filesystem::is_directory(path, problem)) {
-        return failed(FileFailure::NoAccess, path, "is a folder");
+        return Failed(FileFailure::NoAccess, path, "is a folder");
     }
     errno = 0;
     std::ifstream in(path, std::ios::binary);
@@ -135,9 +135,9 @@ FileResult SaveTree(const StoredObject& root, const std::filesystem::path& path,
     try {
         return ReplaceFile(WriteTree(root, sectorSize), path);
     } catch (const StoredError& problem) {
-        return failed(FileFailure::NotStorable, path, problem.what());
+        return Failed(FileFailure::NotStorable, path, problem.what());
     } catch (const std::bad_alloc&) {
-        return failed(FileFailure::NoMemory, path, "not enough memory to write it");
+        return Failed(FileFailure::NoMemory, path, "not enough memory to write it");
     }
 }
 
@@ -148,14 +148,14 @@ FileResult LoadTree(const std::filesystem::path& path, StoredObject& root) {
             return result;
         }
         if (!CarriesSignature(bytes.data(), bytes.size(), nullptr)) {
-            return failed(FileFailure::NotAaf, path, "is no AAF file");
+            return Failed(FileFailure::NotAaf, path, "is no AAF file");
         }
         root = ReadTree(bytes);
         return {};
     } catch (const StoredError& problem) {
-        return failed(FileFailure::Damaged, path, problem.what());
+        return Failed(FileFailure::Damaged, path, problem.what());
     } catch (const std::bad_alloc&) {
-        return failed(FileFailure::NoMemory, path, "not enough memory to read it");
+        return Failed(FileFailure::NoMemory, path, "not enough memory to read it");
     }
 }
 

@@ -2,6 +2,10 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/StoredNames.h"
 
+#include <algorithm>
+
+#include "text/Encodings.h"
+
 namespace aaf::stored {
 
 namespace {
@@ -9,7 +13,7 @@ namespace {
 constexpr std::size_t kSingleSize = 32;
 constexpr std::size_t kCollectionSize = 22;  // leaves room for " index" and "{ffffffff}"
 
-std::u16string hexadecimal(std::uint32_t value) {
+std::u16string Hexadecimal(std::uint32_t value) {
     std::u16string digits;
     do {
         digits.insert(digits.begin(), u"0123456789abcdef"[value & 15]);
@@ -18,8 +22,8 @@ std::u16string hexadecimal(std::uint32_t value) {
     return digits;
 }
 
-std::u16string squeeze(const std::u16string& name, std::uint16_t pid, std::size_t size) {
-    const std::u16string digits = hexadecimal(pid);
+std::u16string Squeeze(const std::u16string& name, std::uint16_t pid, std::size_t size) {
+    const std::u16string digits = Hexadecimal(pid);
     const std::size_t room = size - digits.size() - 2;
     if (name.size() <= room) {
         return name + u'-' + digits;
@@ -29,40 +33,14 @@ std::u16string squeeze(const std::u16string& name, std::uint16_t pid, std::size_
     return name.substr(0, head) + u'-' + name.substr(name.size() - tail) + u'-' + digits;
 }
 
-void AppendUtf8(std::string& out, std::uint32_t point) {
-    if (point < 0x80) {
-        out += static_cast<char>(point);
-    } else if (point < 0x800) {
-        out += static_cast<char>(0xC0 | point >> 6);
-        out += static_cast<char>(0x80 | (point & 0x3F));
-    } else if (point < 0x10000) {
-        out += static_cast<char>(0xE0 | point >> 12);
-        out += static_cast<char>(0x80 | (point >> 6 & 0x3F));
-        out += static_cast<char>(0x80 | (point & 0x3F));
-    } else {
-        out += static_cast<char>(0xF0 | point >> 18);
-        out += static_cast<char>(0x80 | (point >> 12 & 0x3F));
-        out += static_cast<char>(0x80 | (point >> 6 & 0x3F));
-        out += static_cast<char>(0x80 | (point & 0x3F));
-    }
-}
-
-bool IsHighHalf(char16_t unit) {
-    return unit >= 0xD800 && unit < 0xDC00;
-}
-
-bool IsLowHalf(char16_t unit) {
-    return unit >= 0xDC00 && unit < 0xE000;
-}
-
 }  // namespace
 
 std::u16string SingleName(const std::u16string& property, std::uint16_t pid) {
-    return squeeze(property, pid, kSingleSize);
+    return Squeeze(property, pid, kSingleSize);
 }
 
 std::u16string CollectionName(const std::u16string& property, std::uint16_t pid) {
-    return squeeze(property, pid, kCollectionSize);
+    return Squeeze(property, pid, kCollectionSize);
 }
 
 std::u16string IndexName(const std::u16string& collection) {
@@ -70,11 +48,11 @@ std::u16string IndexName(const std::u16string& collection) {
 }
 
 std::u16string ElementName(const std::u16string& collection, std::uint32_t localKey) {
-    return collection + u'{' + hexadecimal(localKey) + u'}';
+    return collection + u'{' + Hexadecimal(localKey) + u'}';
 }
 
 std::u16string PropertyPart(const std::u16string& storedName, std::uint16_t pid) {
-    const std::u16string ending = u'-' + hexadecimal(pid);
+    const std::u16string ending = u'-' + Hexadecimal(pid);
     if (storedName.size() <= ending.size() ||
         storedName.compare(storedName.size() - ending.size(), ending.size(), ending) != 0) {
         return storedName;
@@ -83,23 +61,14 @@ std::u16string PropertyPart(const std::u16string& storedName, std::uint16_t pid)
 }
 
 std::string PropertyText(std::uint16_t pid) {
-    const std::u16string digits = hexadecimal(pid);
+    const std::u16string digits = Hexadecimal(pid);
     return "property " + std::string(4 - digits.size(), '0') + ToUtf8(digits);
 }
 
 std::string ToUtf8(const std::u16string& text) {
-    std::string out;
-    for (std::size_t i = 0; i < text.size(); ++i) {
-        if (IsHighHalf(text[i]) && i + 1 < text.size() && IsLowHalf(text[i + 1])) {
-            AppendUtf8(out, 0x10000 + ((text[i] - 0xD800u) << 10) + (text[i + 1] - 0xDC00u));
-            ++i;
-        } else if (IsHighHalf(text[i]) || IsLowHalf(text[i])) {
-            out += '?';
-        } else {
-            AppendUtf8(out, text[i]);
-        }
-    }
-    return out;
+    std::u32string points = encodings::FromUtf16(text);
+    std::replace_if(points.begin(), points.end(), encodings::IsSurrogate, U'?');
+    return encodings::ToUtf8Lossy(points);
 }
 
 }  // namespace aaf::stored

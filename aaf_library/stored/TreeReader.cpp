@@ -22,7 +22,7 @@ public:
 
     StoredObject Read() {
         ReadTargetPaths();
-        return object(CompoundFileReader::kRootIndex, 0);
+        return ReadObject(CompoundFileReader::kRootIndex, 0);
     }
 
 private:
@@ -39,7 +39,7 @@ private:
         return found->second;
     }
 
-    Bytes stream(const Entry& storage, const std::u16string& name) {
+    Bytes ReadStream(const Entry& storage, const std::u16string& name) {
         return file_.Read(Take(storage, name, Kind::Stream));
     }
 
@@ -48,17 +48,17 @@ private:
         if (root.contained.count(kReferencedPropertiesStream) == 0) {
             return;  // a file without weak references
         }
-        const Bytes table = stream(root, kReferencedPropertiesStream);
+        const Bytes table = ReadStream(root, kReferencedPropertiesStream);
         ByteReader from(table);
-        CheckOrder(from.number<std::uint8_t>());
-        const auto count = from.number<std::uint16_t>();
-        const auto values = from.number<std::uint32_t>();
+        CheckOrder(from.TakeNumber<std::uint8_t>());
+        const auto count = from.TakeNumber<std::uint16_t>();
+        const auto values = from.TakeNumber<std::uint32_t>();
         if (from.left() / 2 < values) {
             throw StoredError("the table of weak references ends early");
         }
         std::vector<std::uint16_t> path;
         for (std::uint32_t i = 0; i < values; ++i) {
-            const auto pid = from.number<std::uint16_t>();
+            const auto pid = from.TakeNumber<std::uint16_t>();
             if (pid != 0) {
                 path.push_back(pid);
                 continue;
@@ -79,29 +79,29 @@ private:
         }
     }
 
-    StoredObject object(std::uint32_t index, int depth) {
+    StoredObject ReadObject(std::uint32_t index, int depth) {
         if (depth > kMaximumDepth) {
             throw StoredError("objects are nested too deep");
         }
         const Entry& storage = file_.entry(index);
         StoredObject object;
         object.classId = storage.classId;
-        const Bytes table = stream(storage, kPropertiesStream);
+        const Bytes table = ReadStream(storage, kPropertiesStream);
         ByteReader entries(table);
-        CheckOrder(entries.number<std::uint8_t>());
-        entries.number<std::uint8_t>();  // the version, of which only one was ever in use
-        const auto count = entries.number<std::uint16_t>();
+        CheckOrder(entries.TakeNumber<std::uint8_t>());
+        entries.TakeNumber<std::uint8_t>();  // the version, of which only one was ever in use
+        const auto count = entries.TakeNumber<std::uint16_t>();
         ByteReader values = entries;
-        values.bytes(std::size_t{count} * 6);
+        values.TakeBytes(std::size_t{count} * 6);
         object.properties.reserve(count);
         std::set<std::uint16_t> pids;
         for (std::uint16_t i = 0; i < count; ++i) {
             StoredProperty property;
-            property.pid = entries.number<std::uint16_t>();
-            property.form = StoredForm(entries.number<std::uint16_t>());
-            const auto size = entries.number<std::uint16_t>();
+            property.pid = entries.TakeNumber<std::uint16_t>();
+            property.form = StoredForm(entries.TakeNumber<std::uint16_t>());
+            const auto size = entries.TakeNumber<std::uint16_t>();
             try {
-                property.bytes = values.bytes(size);
+                property.bytes = values.TakeBytes(size);
                 if (!pids.insert(property.pid).second) {
                     throw StoredError("occurs twice");
                 }
@@ -123,7 +123,7 @@ private:
         switch (property.form) {
             case StoredForm::StrongReference: {
                 const std::u16string name = StoredName(property, ByteReader(value));
-                property.objects.push_back(contained(storage, name, depth));
+                property.objects.push_back(ReadContained(storage, name, depth));
                 return;
             }
             case StoredForm::StrongVector:
@@ -136,8 +136,8 @@ private:
                 return ReadWeakCollection(storage, property, value);
             case StoredForm::Stream: {
                 ByteReader from(value);
-                from.number<std::uint8_t>();  // the byte order, of no use for plain bytes
-                property.bytes = stream(storage, StoredName(property, from));
+                from.TakeNumber<std::uint8_t>();  // the byte order, of no use for plain bytes
+                property.bytes = ReadStream(storage, StoredName(property, from));
                 return;
             }
             case StoredForm::Data:
@@ -147,15 +147,15 @@ private:
     }
 
     static std::u16string StoredName(StoredProperty& property, ByteReader from) {
-        std::u16string name = from.text();
+        std::u16string name = from.TakeText();
         property.name = PropertyPart(name, property.pid);
         return name;
     }
 
-    StoredObject contained(const Entry& storage, const std::u16string& name, int depth) {
+    StoredObject ReadContained(const Entry& storage, const std::u16string& name, int depth) {
         const std::uint32_t index = Take(storage, name, Kind::Storage);
         try {
-            return object(index, depth + 1);
+            return ReadObject(index, depth + 1);
         } catch (const StoredError& problem) {
             throw StoredError(ToUtf8(name) + ": " + problem.what());
         }
@@ -165,23 +165,23 @@ private:
                               int depth) {
         const bool isSet = property.form == StoredForm::StrongSet;
         const std::u16string name = StoredName(property, ByteReader(value));
-        const Bytes index = stream(storage, IndexName(name));
+        const Bytes index = ReadStream(storage, IndexName(name));
         ByteReader from(index);
-        const auto count = from.number<std::uint32_t>();
-        from.bytes(8);  // which keys are free; only a writer would want to know
+        const auto count = from.TakeNumber<std::uint32_t>();
+        from.TakeBytes(8);  // which keys are free; only a writer would want to know
         if (isSet) {
-            property.keyPid = from.number<std::uint16_t>();
+            property.keyPid = from.TakeNumber<std::uint16_t>();
             ReadKeySize(property, from);
         }
         CheckCount(count, from.left(), isSet ? std::size_t{8} + property.keySize : 4);
         property.objects.reserve(count);
         for (std::uint32_t i = 0; i < count; ++i) {
-            const auto localKey = from.number<std::uint32_t>();
+            const auto localKey = from.TakeNumber<std::uint32_t>();
             if (isSet) {
-                from.number<std::uint32_t>();  // the count of references
-                property.keys.push_back(from.bytes(property.keySize));
+                from.TakeNumber<std::uint32_t>();  // the count of references
+                property.keys.push_back(from.TakeBytes(property.keySize));
             }
-            property.objects.push_back(contained(storage, ElementName(name, localKey), depth));
+            property.objects.push_back(ReadContained(storage, ElementName(name, localKey), depth));
         }
         if (isSet) {
             CheckUnique(property.keys);
@@ -192,18 +192,18 @@ private:
         ByteReader from(value);
         ReadTarget(property, from);
         ReadKeySize(property, from);
-        property.keys.push_back(from.bytes(property.keySize));
+        property.keys.push_back(from.TakeBytes(property.keySize));
     }
 
     void ReadWeakCollection(const Entry& storage, StoredProperty& property, const Bytes& value) {
-        const Bytes index = stream(storage, IndexName(StoredName(property, ByteReader(value))));
+        const Bytes index = ReadStream(storage, IndexName(StoredName(property, ByteReader(value))));
         ByteReader from(index);
-        const auto count = from.number<std::uint32_t>();
+        const auto count = from.TakeNumber<std::uint32_t>();
         ReadTarget(property, from);
         ReadKeySize(property, from);
         CheckCount(count, from.left(), property.keySize);
         for (std::uint32_t i = 0; i < count; ++i) {
-            property.keys.push_back(from.bytes(property.keySize));
+            property.keys.push_back(from.TakeBytes(property.keySize));
         }
         if (property.form == StoredForm::WeakSet) {
             CheckUnique(property.keys);
@@ -211,8 +211,8 @@ private:
     }
 
     void ReadTarget(StoredProperty& property, ByteReader& from) {
-        const auto tag = from.number<std::uint16_t>();
-        property.keyPid = from.number<std::uint16_t>();
+        const auto tag = from.TakeNumber<std::uint16_t>();
+        property.keyPid = from.TakeNumber<std::uint16_t>();
         if (tag >= paths_.size()) {
             throw StoredError("a weak reference has tag " + std::to_string(tag) +
                               ", the file has " + std::to_string(paths_.size()) + " paths");
@@ -221,7 +221,7 @@ private:
     }
 
     static void ReadKeySize(StoredProperty& property, ByteReader& from) {
-        property.keySize = from.number<std::uint8_t>();
+        property.keySize = from.TakeNumber<std::uint8_t>();
         if (!IsKeySize(property.keySize)) {
             throw StoredError("a key of " + std::to_string(property.keySize) + " bytes");
         }

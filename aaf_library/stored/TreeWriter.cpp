@@ -48,18 +48,18 @@ public:
         return tag;
     }
 
-    Bytes table() const {
+    Bytes Table() const {
         ByteWriter pids;
         for (const std::vector<std::uint16_t>& path : paths_) {
             for (std::uint16_t pid : path) {
-                pids.number(pid);
+                pids.AppendNumber(pid);
             }
-            pids.number(std::uint16_t{0});
+            pids.AppendNumber(std::uint16_t{0});
         }
         return ByteWriter()
-            .number(kLittleEndianMark)
-            .number(static_cast<std::uint16_t>(paths_.size()))
-            .number(static_cast<std::uint32_t>(pids.bytes().size() / 2))
+            .AppendNumber(kLittleEndianMark)
+            .AppendNumber(static_cast<std::uint16_t>(paths_.size()))
+            .AppendNumber(static_cast<std::uint32_t>(pids.bytes().size() / 2))
             .Append(pids.bytes())
             .bytes();
     }
@@ -93,16 +93,16 @@ struct Layout {
             throw StoredError(std::to_string(value.size()) + " bytes, a value may take " +
                               std::to_string(kLargestValue));
         }
-        entries.number(property.pid)
-            .number(static_cast<std::uint16_t>(property.form))
-            .number(static_cast<std::uint16_t>(value.size()));
+        entries.AppendNumber(property.pid)
+            .AppendNumber(static_cast<std::uint16_t>(property.form))
+            .AppendNumber(static_cast<std::uint16_t>(value.size()));
         values.Append(value);
         ++count;
     }
 };
 
 Bytes NameValue(const std::u16string& name) {
-    return ByteWriter().text(name).bytes();
+    return ByteWriter().AppendText(name).bytes();
 }
 
 std::uint8_t CheckedKeySize(const StoredProperty& property) {
@@ -125,7 +125,7 @@ public:
         Fill(file_.root(), root, 0);
         // Tags are handed out on the way, so the table comes last. Readers
         // want it, even without a path in it.
-        file_.root().stream(kReferencedPropertiesStream, paths_.table());
+        file_.root().stream(kReferencedPropertiesStream, paths_.Table());
         return file_.Finish();
     }
 
@@ -152,13 +152,14 @@ private:
     void WriteLayout(StorageWriter& storage, const StoredObject& object, const Layout& layout,
                      int depth) {
         storage.SetClass(object.classId);
-        storage.stream(kPropertiesStream, ByteWriter()
-                                              .number(kLittleEndianMark)
-                                              .number(kPropertiesVersion)
-                                              .number(static_cast<std::uint16_t>(layout.count))
-                                              .Append(layout.entries.bytes())
-                                              .Append(layout.values.bytes())
-                                              .bytes());
+        storage.stream(kPropertiesStream,
+                       ByteWriter()
+                           .AppendNumber(kLittleEndianMark)
+                           .AppendNumber(kPropertiesVersion)
+                           .AppendNumber(static_cast<std::uint16_t>(layout.count))
+                           .Append(layout.entries.bytes())
+                           .Append(layout.values.bytes())
+                           .bytes());
         for (const Layout::Stream& stream : layout.streams) {
             storage.stream(stream.name, stream.borrowed ? *stream.borrowed : stream.made);
         }
@@ -210,9 +211,9 @@ private:
         const std::u16string name = CollectionName(property.name, property.pid);
         const auto count = static_cast<std::uint32_t>(property.objects.size());
         ByteWriter index;
-        index.number(count).number(count).number(kNoLastFreeKey);
+        index.AppendNumber(count).AppendNumber(count).AppendNumber(kNoLastFreeKey);
         for (std::uint32_t i = 0; i < count; ++i) {
-            index.number(i);
+            index.AppendNumber(i);
             layout.children.push_back({ElementName(name, i), &property.objects[i]});
         }
         layout.Add(property, NameValue(name));
@@ -224,8 +225,8 @@ private:
         const std::vector<std::size_t> order = KeyOrder(property);
         const auto count = static_cast<std::uint32_t>(order.size());
         ByteWriter index;
-        index.number(count).number(count).number(kNoLastFreeKey);
-        index.number(property.keyPid).number(CheckedKeySize(property));
+        index.AppendNumber(count).AppendNumber(count).AppendNumber(kNoLastFreeKey);
+        index.AppendNumber(property.keyPid).AppendNumber(CheckedKeySize(property));
         for (std::uint32_t i = 0; i < count; ++i) {
             const StoredObject& object = property.objects[order[i]];
             const Bytes& key = property.keys[order[i]];
@@ -233,7 +234,7 @@ private:
             if (stored == nullptr || stored->bytes != key) {
                 throw StoredError("an element does not store its key");
             }
-            index.number(i).number(kSetReferenceCount).Append(key);
+            index.AppendNumber(i).AppendNumber(kSetReferenceCount).Append(key);
             layout.children.push_back({ElementName(name, i), &object});
         }
         layout.Add(property, NameValue(name));
@@ -265,9 +266,9 @@ private:
                               std::to_string(property.keys.size()));
         }
         layout.Add(property, ByteWriter()
-                                 .number(paths_.tag(property.targetPath))
-                                 .number(property.keyPid)
-                                 .number(CheckedKeySize(property))
+                                 .AppendNumber(paths_.tag(property.targetPath))
+                                 .AppendNumber(property.keyPid)
+                                 .AppendNumber(CheckedKeySize(property))
                                  .Append(property.keys.front())
                                  .bytes());
     }
@@ -278,9 +279,9 @@ private:
         }
         const std::u16string name = CollectionName(property.name, property.pid);
         ByteWriter index;
-        index.number(static_cast<std::uint32_t>(property.keys.size()));
-        index.number(paths_.tag(property.targetPath)).number(property.keyPid);
-        index.number(CheckedKeySize(property));
+        index.AppendNumber(static_cast<std::uint32_t>(property.keys.size()));
+        index.AppendNumber(paths_.tag(property.targetPath)).AppendNumber(property.keyPid);
+        index.AppendNumber(CheckedKeySize(property));
         for (const Bytes& key : InOrder(property)) {
             index.Append(key);
         }
@@ -304,7 +305,7 @@ private:
             return;
         }
         const std::u16string name = SingleName(property.name, property.pid);
-        layout.Add(property, ByteWriter().number(kStreamMark).text(name).bytes());
+        layout.Add(property, ByteWriter().AppendNumber(kStreamMark).AppendText(name).bytes());
         layout.streams.push_back({name, {}, &property.bytes});
     }
 

@@ -58,6 +58,18 @@ aafTimeStamp_t ParseTime(const std::string& text) {
     return time;
 }
 
+// The module sees a failed creation; why the library is missing is told when the failure is.
+template <auto make>
+void RegisterMovieComponent(host::Host& host, const GUID& id) {
+    host.RegisterComponent(id, host::MakerOf([](INCFUnknown*) -> decltype(make()) {
+                               try {
+                                   return make();
+                               } catch (const host::MovieLibraryMissing&) {
+                                   return nullptr;
+                               }
+                           }));
+}
+
 std::string WithoutLineEnd(std::string text) {
     while (!text.empty() && (text.back() == '\n' || text.back() == ' ')) {
         text.pop_back();
@@ -89,12 +101,9 @@ Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) 
     host::RegisterXmlComponents(*host_);
     host::RegisterParameterComponents(*host_);
     host_->RegisterComponent(NCFCompID_QTParser, header_parser::QTParserMaker());
-    host_->RegisterComponent(QTWrapper::CompID_QuickTimeWrapper, host::MakerOf([](INCFUnknown*) {
-                                 return host::MakeQuickTimeWrapper();
-                             }));
-    host_->RegisterComponent(QuickTime::CompID_QuickTimeProperty, host::MakerOf([](INCFUnknown*) {
-                                 return host::MakeQuickTimeProperty();
-                             }));
+    RegisterMovieComponent<host::MakeQuickTimeWrapper>(*host_, QTWrapper::CompID_QuickTimeWrapper);
+    RegisterMovieComponent<host::MakeQuickTimeProperty>(*host_,
+                                                        QuickTime::CompID_QuickTimeProperty);
 
     const std::filesystem::path module =
         options.plugin.empty() ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"

@@ -141,9 +141,8 @@ std::vector<SampleTime> TimesInLibrary(const std::filesystem::path& movie) {
     host::Ref<QTWrapper::IQTWSampleTable> table;
     ncfUInt32 track = 0;
     ncfUInt64 count = 0;
-    if (!wrapper || wrapper->NewMovieFromFilePath(path.get()) < 0 ||
-        !wrapper->GetFirstVideoTrack(&track) || wrapper->GetSampleTable(table.Out()) < 0 ||
-        table->GetNumSamples(track, &count) < 0) {
+    if (wrapper->NewMovieFromFilePath(path.get()) < 0 || !wrapper->GetFirstVideoTrack(&track) ||
+        wrapper->GetSampleTable(table.Out()) < 0 || table->GetNumSamples(track, &count) < 0) {
         return {};
     }
     std::vector<SampleTime> times;

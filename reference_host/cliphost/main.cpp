@@ -16,6 +16,7 @@
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/SettingsOptions.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/quicktime/MovieComponents.h"
 #include "reference_host/system/Process.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -105,6 +106,9 @@ int Run(int argc, char** argv) {
     } catch (const Failure& failure) {
         TellProblem(failure.problem(), session.verbosity);
         return failure.status();
+    } catch (const host::MovieLibraryMissing& missing) {
+        Tell(std::string(missing.what()) + "; install cliphost anew, with all its files");
+        return kExitCaller;
     } catch (const std::system_error& error) {
         if (std::ferror(stdout) != 0) {
             return OutputStatus(error.code().value(), status);

@@ -37,14 +37,16 @@ TEST_F(MovieLibrary, IsNotNeededWhereTheHeaderTellsAll) {
     }
 }
 
-TEST_F(MovieLibrary, ThatIsMissingIsNamedWhereItIsNeeded) {
-    ExpectSays(Run("describe " + Quoted(MadeMovie("h264_aspect.mov"))), 1,
-               "it can't be loaded: " + (folder() / kLibrary).string());
+TEST_F(MovieLibrary, ThatIsMissingIsTheInstallationsFaultAndNoMovies) {
+    for (const char* verb : {"describe ", "samples ", "formats "}) {
+        ExpectSays(Run(verb + Quoted(MadeMovie("h264_aspect.mov"))), 2,
+                   "cliphost: " + (folder() / kLibrary).string() + ": ");
+    }
 }
 
 TEST_F(MovieLibrary, OfAnotherKindIsRefused) {
     fs::copy(ProgramFolder() / "libNMAUtilLib20.so", folder() / kLibrary);
-    ExpectSays(Run("describe " + Quoted(MadeMovie("h264_aspect.mov"))), 1,
+    ExpectSays(Run("describe " + Quoted(MadeMovie("h264_aspect.mov"))), 2,
                (folder() / kLibrary).string() + " is not the library of this program");
 }
 

@@ -2,7 +2,12 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/quicktime/loading/MovieLibrary.h"
 
+extern "C" {
+#include <libavutil/log.h>
+}
+
 extern "C" __attribute__((visibility("default"))) const host::MovieLibrary* CliphostMovieLibrary() {
+    av_log_set_level(AV_LOG_QUIET);  // results tell what goes wrong
     static const host::MovieLibrary library = {
         host::MakeQuickTimeWrapper, host::MakeQuickTimeProperty, host::OpenProblem,
         host::DecoderProblem,       host::DecoderProblem,        host::RasterProblem,

@@ -40,43 +40,41 @@ const Loading& Loaded() {
     return loading;
 }
 
-const MovieLibrary* Library() {
-    return Loaded().library;
-}
-
-std::string WhyMissing() {
-    return "it can't be loaded: " + Loaded().problem;
+const MovieLibrary& Library() {
+    if (!Loaded().library) {
+        throw MovieLibraryMissing(Loaded().problem);
+    }
+    return *Loaded().library;
 }
 
 }  // namespace
 
 Ref<QTWrapper::IQuickTimeWrapper> MakeQuickTimeWrapper() {
-    return Library() ? Library()->makeWrapper() : nullptr;
+    return Library().makeWrapper();
 }
 
 Ref<QuickTime::IQuickTimeProperty> MakeQuickTimeProperty() {
-    return Library() ? Library()->makeProperty() : nullptr;
+    return Library().makeProperty();
 }
 
 std::string OpenProblem(const std::filesystem::path& path) {
-    return Library() ? Library()->openProblem(path) : WhyMissing();
+    return Library().openProblem(path);
 }
 
 CodecProblem DecoderProblem(const std::filesystem::path& path, bool ofSound, std::size_t place) {
-    return Library() ? Library()->decoderProblemOfKind(path, ofSound, place)
-                     : CodecProblem{WhyMissing()};
+    return Library().decoderProblemOfKind(path, ofSound, place);
 }
 
 CodecProblem DecoderProblem(const std::filesystem::path& path, std::size_t track) {
-    return Library() ? Library()->decoderProblemOfTrack(path, track) : CodecProblem{WhyMissing()};
+    return Library().decoderProblemOfTrack(path, track);
 }
 
 std::string RasterProblem(const std::filesystem::path& path) {
-    return Library() ? Library()->rasterProblem(path) : WhyMissing();
+    return Library().rasterProblem(path);
 }
 
 DisplayMatrix DisplayMatrixOf(const std::filesystem::path& movie) {
-    return Library() ? Library()->displayMatrix(movie) : DisplayMatrix();
+    return Library().displayMatrix(movie);
 }
 
 }  // namespace host

@@ -36,12 +36,12 @@ Bytes FileWith(const std::function<void(StorageWriter&)>& fill) {
 // A properties stream with one property.
 Bytes OneProperty(std::uint16_t pid, std::uint16_t form, const Bytes& value) {
     return ByteWriter()
-        .number(std::uint8_t{0x4C})
-        .number(std::uint8_t{0x20})
-        .number(std::uint16_t{1})
-        .number(pid)
-        .number(form)
-        .number(static_cast<std::uint16_t>(value.size()))
+        .AppendNumber(std::uint8_t{0x4C})
+        .AppendNumber(std::uint8_t{0x20})
+        .AppendNumber(std::uint16_t{1})
+        .AppendNumber(pid)
+        .AppendNumber(form)
+        .AppendNumber(static_cast<std::uint16_t>(value.size()))
         .Append(value)
         .bytes();
 }
@@ -148,10 +148,10 @@ TEST(DamagedFile, WithANameThatDoesNotEndIsRefused) {
 
 TEST(DamagedFile, WithOneObjectInTwoPlacesIsRefused) {
     Bytes index = ByteWriter()
-                      .number(std::uint32_t{2})
-                      .number(std::uint64_t{0})
-                      .number(std::uint32_t{0})
-                      .number(std::uint32_t{0})
+                      .AppendNumber(std::uint32_t{2})
+                      .AppendNumber(std::uint64_t{0})
+                      .AppendNumber(std::uint32_t{0})
+                      .AppendNumber(std::uint32_t{0})
                       .bytes();
     const Bytes file = FileWith([&](StorageWriter& root) {
         root.stream(u"properties", OneProperty(0x4403, 0x32, name(u"Slots-4403")));
@@ -177,10 +177,12 @@ TEST(DamagedFile, WithAnIndexThatClaimsTooMuchIsRefused) {
 
 TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
     ByteWriter index;
-    index.number(std::uint32_t{2}).number(std::uint64_t{0}).number(std::uint16_t{5});
-    index.number(std::uint8_t{16});
+    index.AppendNumber(std::uint32_t{2})
+        .AppendNumber(std::uint64_t{0})
+        .AppendNumber(std::uint16_t{5});
+    index.AppendNumber(std::uint8_t{16});
     for (std::uint32_t i = 0; i < 2; ++i) {
-        index.number(i).number(std::uint32_t{1}).Append(Bytes(16, 7));
+        index.AppendNumber(i).AppendNumber(std::uint32_t{1}).Append(Bytes(16, 7));
     }
     const Bytes file = FileWith([&](StorageWriter& root) {
         root.stream(u"properties", OneProperty(0x1901, 0x3A, name(u"Mobs-1901")));
