@@ -119,7 +119,7 @@ BENCHMARK(Ffprobe)
 }  // namespace
 
 int main(int argc, char** argv) {
-    return RunWithRatios(argc, argv,
-                         {{"Describe", "ReadAndHash", "at most 2, for long tables"},
-                          {"Describe", "Ffprobe", "at most 0.3"}});
+    return RunWithRatios(
+        argc, argv,
+        {{"Describe", "ReadAndHash", TimesAtMost(2)}, {"Describe", "Ffprobe", TimesAtMost(0.25)}});
 }

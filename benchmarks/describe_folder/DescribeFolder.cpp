@@ -112,5 +112,5 @@ BENCHMARK(OpenAndFindStreams)->Unit(benchmark::kMillisecond)->UseRealTime()->Rep
 }  // namespace
 
 int main(int argc, char** argv) {
-    return RunWithRatios(argc, argv, {{"DescribeFolder", "OpenAndFindStreams", "at most 0.667"}});
+    return RunWithRatios(argc, argv, {{"DescribeFolder", "OpenAndFindStreams", TimesAtMost(0.5)}});
 }

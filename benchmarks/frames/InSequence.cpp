@@ -138,7 +138,7 @@ int main(int argc, char** argv) {
             for (const Layout& layout : depth.layouts) {
                 pairs.push_back({Register("Reader", Reader, depth, raster, layout),
                                  Register("Ffmpeg", Ffmpeg, depth, raster, layout),
-                                 "at most 1 times"});
+                                 RateAtLeast(1)});
             }
         }
     }

@@ -14,6 +14,7 @@
 
 #include "benchmarks/frames/SampleFilm.h"
 #include "benchmarks/support/Brief.h"
+#include "benchmarks/support/Ratios.h"
 #include "reference_host/quicktime/AvOwners.h"
 
 namespace {
@@ -125,4 +126,6 @@ BENCHMARK(BareLoop)
 
 }  // namespace
 
-BENCHMARK_MAIN();
+int main(int argc, char** argv) {
+    return RunWithRatios(argc, argv, {{"Reader", "BareLoop", RateAtLeast(1)}});
+}

@@ -12,6 +12,7 @@
 
 #include "benchmarks/header_parser/LongMovie.h"
 #include "benchmarks/support/Brief.h"
+#include "benchmarks/support/Ratios.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/util/Ref.h"
 
@@ -90,4 +91,6 @@ BENCHMARK(ReadTheSameBytes)
 
 }  // namespace
 
-BENCHMARK_MAIN();
+int main(int argc, char** argv) {
+    return RunWithRatios(argc, argv, {{"ParseHeader", "ReadTheSameBytes", NoGoal}});
+}

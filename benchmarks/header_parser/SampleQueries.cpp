@@ -9,8 +9,10 @@
 
 #include <map>
 #include <random>
+#include <vector>
 
 #include "benchmarks/header_parser/LongMovie.h"
+#include "benchmarks/support/Ratios.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/util/Ref.h"
 #include "tests/support/movies/TrackAtoms.h"
@@ -167,4 +169,11 @@ BENCHMARK(ShownAt)->Arg(1000)->Arg(1000000);
 
 }  // namespace
 
-BENCHMARK_MAIN();
+int main(int argc, char** argv) {
+    std::vector<Pair> pairs;
+    for (const char* query :
+         {"Offset", "Size", "Flags", "DisplayOffset", "NextChange", "ShownAt"}) {
+        pairs.push_back({query, "", ASecondAtLeast(5e6)});
+    }
+    return RunWithRatios(argc, argv, pairs);
+}

@@ -11,6 +11,7 @@
 #include <random>
 #include <vector>
 
+#include "benchmarks/support/Ratios.h"
 #include "source/essence/AlphaExtraction.h"
 #include "source/essence/FloatConversion.h"
 #include "source/essence/FormatEnums.h"
@@ -156,4 +157,16 @@ BENCHMARK(R4flToB64a);
 
 }  // namespace
 
-BENCHMARK_MAIN();
+int main(int argc, char** argv) {
+    std::vector<Pair> pairs;
+    for (const char* ours : {"ExpandBGRA", "CompressBGRA", "OpaqueBGRA", "AlphaOfBGRA"}) {
+        pairs.push_back({ours, "CopyBGRA", RateAtLeast(0.9)});
+    }
+    for (const char* ours : {"ExpandB64a", "CompressB64a", "OpaqueB64a", "AlphaOfB64a"}) {
+        pairs.push_back({ours, "CopyB64a", RateAtLeast(0.9)});
+    }
+    for (const char* ours : {"R4flToB64a", "AlphaOfR4fl"}) {
+        pairs.push_back({ours, "CopyR4fl", RateAtLeast(0.9)});
+    }
+    return RunWithRatios(argc, argv, pairs);
+}

@@ -11,25 +11,85 @@
 
 namespace {
 
-// Keeps the wall time of every run, by name and arguments, beside printing it.
+// Of one run: the seconds that it took, and the items that it told of.
+struct Measured {
+    double seconds = 0;
+    double itemsASecond = 0;  // 0: it counted none
+};
+
+// Keeps every run, by name and arguments, beside printing it.
 class KeepingReporter : public benchmark::ConsoleReporter {
 public:
     void ReportRuns(const std::vector<Run>& runs) override {
         for (const Run& run : runs) {
             if (run.run_type == Run::RT_Iteration && !run.error_occurred) {
-                times[run.run_name.function_name][run.run_name.args].push_back(
-                    run.real_accumulated_time / static_cast<double>(run.iterations));
+                const auto items = run.counters.find("items_per_second");
+                kept[run.run_name.function_name][run.run_name.args].push_back(
+                    {run.real_accumulated_time / static_cast<double>(run.iterations),
+                     items == run.counters.end() ? 0.0 : items->second.value});
             }
         }
         ConsoleReporter::ReportRuns(runs);
     }
 
-    std::map<std::string, std::map<std::string, std::vector<double>>> times;
+    std::map<std::string, std::map<std::string, std::vector<Measured>>> kept;
 };
 
-double Median(std::vector<double> values) {
-    std::sort(values.begin(), values.end());
-    return values[values.size() / 2];
+Measured Median(std::vector<Measured> runs) {
+    std::sort(runs.begin(), runs.end(), [](const Measured& left, const Measured& right) {
+        return left.seconds < right.seconds;
+    });
+    return runs[runs.size() / 2];
+}
+
+std::string Text(const char* form, double number) {
+    char text[64];
+    std::snprintf(text, sizeof text, form, number);
+    return text;
+}
+
+std::string Duration(double seconds) {
+    return seconds < 1e-6   ? Text("%.3g ns", seconds * 1e9)
+           : seconds < 1e-3 ? Text("%.3g us", seconds * 1e6)
+           : seconds < 1    ? Text("%.3g ms", seconds * 1e3)
+                            : Text("%.3g s", seconds);
+}
+
+struct Verdict {
+    std::string ratio;
+    std::string wanted;
+    bool isMet = true;
+};
+
+Verdict Judge(const Goal& goal, const Measured& ours, const Measured& peer) {
+    const double times = ours.seconds / peer.seconds;
+    const double rate = ours.itemsASecond > 0 ? ours.itemsASecond : 1 / ours.seconds;
+    switch (goal.of) {
+        case Goal::Of::TimeRatio:
+            return {Text("%.3g", times), Text("at most %g", goal.bound), times <= goal.bound};
+        case Goal::Of::RateRatio:
+            return {Text("%.3g", 1 / times), Text("at least %g", goal.bound),
+                    1 / times >= goal.bound};
+        case Goal::Of::Time:
+            return {"", "at most " + Duration(goal.bound), ours.seconds <= goal.bound};
+        case Goal::Of::Rate:
+            return {Text("%.3g a second", rate), Text("at least %.3g a second", goal.bound),
+                    rate >= goal.bound};
+        case Goal::Of::Nothing:
+            break;
+    }
+    return {Text("%.3g", times), "", true};
+}
+
+void PrintRow(const std::string& work, const Pair& pair, const Measured& ours,
+              const Measured* peer) {
+    const Verdict verdict = Judge(pair.goal, ours, peer ? *peer : Measured{1, 0});
+    std::printf("| %s | %s | %s | %s | %s | %s | %s |\n", work.c_str(), pair.peer.c_str(),
+                peer ? Duration(peer->seconds).c_str() : "", Duration(ours.seconds).c_str(),
+                verdict.ratio.c_str(), verdict.wanted.c_str(),
+                verdict.wanted.empty() ? ""
+                : verdict.isMet        ? "met"
+                                       : "MISSED");
 }
 
 }  // namespace
@@ -42,14 +102,15 @@ int RunWithRatios(int argc, char** argv, const std::vector<Pair>& pairs) {
     KeepingReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
     for (const Pair& pair : pairs) {
-        const auto& ours = reporter.times[pair.ours];
-        const auto& peers = reporter.times[pair.peer];
-        for (const auto& [arguments, times] : ours) {
+        for (const auto& [arguments, runs] : reporter.kept[pair.ours]) {
+            const std::string work = arguments.empty() ? pair.ours : pair.ours + " " + arguments;
+            const auto& peers = reporter.kept[pair.peer];
             const auto peer = peers.find(arguments);
-            if (peer != peers.end()) {
-                std::printf("ratio %s / %s %s: %.3f (wanted: %s)\n", pair.ours.c_str(),
-                            pair.peer.c_str(), arguments.c_str(),
-                            Median(times) / Median(peer->second), pair.wanted.c_str());
+            if (pair.peer.empty()) {
+                PrintRow(work, pair, Median(runs), nullptr);
+            } else if (peer != peers.end()) {
+                const Measured median = Median(peer->second);
+                PrintRow(work, pair, Median(runs), &median);
             }
         }
     }

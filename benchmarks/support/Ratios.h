@@ -5,14 +5,41 @@
 #include <string>
 #include <vector>
 
-// Two benchmarks of one program whose times are compared: `ours` beside
-// `peer`, each with every argument that both have.
+// What a benchmark has to reach.
+struct Goal {
+    enum class Of {
+        Nothing,
+        TimeRatio,  // our time divided by the peer's: at most
+        RateRatio,  // our rate divided by the peer's: at least
+        Time,       // of one run, in seconds: at most
+        Rate,       // runs or items a second: at least
+    };
+    Of of = Of::Nothing;
+    double bound = 0;
+};
+
+constexpr Goal NoGoal{};
+constexpr Goal TimesAtMost(double ratio) {
+    return {Goal::Of::TimeRatio, ratio};
+}
+constexpr Goal RateAtLeast(double ratio) {
+    return {Goal::Of::RateRatio, ratio};
+}
+constexpr Goal SecondsAtMost(double seconds) {
+    return {Goal::Of::Time, seconds};
+}
+constexpr Goal ASecondAtLeast(double count) {
+    return {Goal::Of::Rate, count};
+}
+
+// Two benchmarks of one program that do the same work: `ours` beside `peer`, each with every
+// argument that both have. Without a peer, ours alone is held to the goal.
 struct Pair {
     std::string ours;
     std::string peer;
-    std::string wanted;  // in words, such as "at most 2 times"
+    Goal goal;
 };
 
-// Runs the registered benchmarks, prints them as usual, and behind them the
-// ratio ours / peer of the medians for each pair. To be called from main.
+// Runs the registered benchmarks, prints them as usual, and behind them a row of a table for
+// each pair, of the medians of their runs. To be called from main.
 int RunWithRatios(int argc, char** argv, const std::vector<Pair>& pairs);
