@@ -36,7 +36,7 @@ CompoundFileReader::Entry ParseEntry(const std::uint8_t* bytes) {
     entry.child = from.TakeNumber<std::uint32_t>();
     const Bytes classId = from.TakeBytes(entry.classId.size());
     std::copy(classId.begin(), classId.end(), entry.classId.begin());
-    from.bytes(4 + 8 + 8);  // user flags and times
+    from.TakeBytes(4 + 8 + 8);  // user flags and times
     entry.start = from.TakeNumber<std::uint32_t>();
     entry.size = from.TakeNumber<std::uint64_t>();
     return entry;

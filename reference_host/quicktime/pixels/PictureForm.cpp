@@ -98,8 +98,10 @@ bool PictureForm::CanRead(AVPixelFormat format) {
     const AVPixFmtDescriptor* const found = av_pix_fmt_desc_get(format);
     constexpr std::uint64_t kForeign =
         AV_PIX_FMT_FLAG_BITSTREAM | AV_PIX_FMT_FLAG_HWACCEL | AV_PIX_FMT_FLAG_BAYER;
-    if (!found || (found->flags & kForeign) != 0 || format == AV_PIX_FMT_XYZ12LE ||
-        format == AV_PIX_FMT_XYZ12BE) {
+    // Of UYYVYY411 a description of steps can't tell where its luma stands.
+    const bool isOdd = format == AV_PIX_FMT_XYZ12LE || format == AV_PIX_FMT_XYZ12BE ||
+                       format == AV_PIX_FMT_UYYVYY411;
+    if (!found || (found->flags & kForeign) != 0 || isOdd) {
         return false;
     }
     return (found->flags & AV_PIX_FMT_FLAG_FLOAT) == 0

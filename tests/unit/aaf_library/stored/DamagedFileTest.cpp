@@ -47,7 +47,7 @@ Bytes OneProperty(std::uint16_t pid, std::uint16_t form, const Bytes& value) {
 }
 
 Bytes name(const std::u16string& text) {
-    return ByteWriter().text(text).bytes();
+    return ByteWriter().AppendText(text).bytes();
 }
 
 Bytes FileWithProperties(const Bytes& properties) {

@@ -51,7 +51,7 @@ StoredProperty data(std::uint16_t pid, Bytes value) {
 }
 
 StoredProperty text(std::uint16_t pid, const std::u16string& value) {
-    return data(pid, ByteWriter().text(value).bytes());
+    return data(pid, ByteWriter().AppendText(value).bytes());
 }
 
 StoredProperty reference(std::uint16_t pid, const std::u16string& name, StoredObject object) {
