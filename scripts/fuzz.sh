@@ -46,7 +46,7 @@ for target in "${targets[@]}"; do
   "$target" "${arguments[@]}" "${folders[@]}" >"$logs/$name.log" 2>&1 &
   running+=($!)
 done
-echo "${#targets[@]} targets for $minutes min; logs lie in $logs"
+echo "${#targets[@]} targets for $minutes min; logs are in $logs"
 for process in "${running[@]}"; do wait "$process" || true; done
 running=()
 

@@ -16,8 +16,8 @@ struct ISampleMapping;
 // operation that needs it, and shared with every sample mapping, so mappings may
 // outlive the container.
 struct IMediaContainer : INCFUnknown {
-    // 3. 1 when the file could be loaded, 0 when not. May throw an NCFRESULT:
-    // the one operation that does, for a file that can't be opened.
+    // 3. 1 when the file could be loaded, 0 when not. Lets exceptions
+    // through: an NCFRESULT for a file that can't be opened.
     virtual NCFRESULT IsContainerSupported() = 0;
     virtual NCFRESULT ContainerFlag() = 0;  // 4: 1
     // 5. NCF_E_NOTIMPL.

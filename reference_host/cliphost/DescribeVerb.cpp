@@ -192,8 +192,8 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
     verb->add_option("paths", options->paths, "Movies and folders")->required();
-    auto* const aaf = verb->add_option("--aaf", options->aafFile,
-                                       "Save the one movie's file here; - for standard output");
+    auto* const aaf = verb->add_option(
+        "--aaf", options->aafFile, "Save the file of the only movie here; - for standard output");
     verb->add_option("--out-dir", options->outFolder, "Save every movie's file in this folder")
         ->excludes(aaf);
     verb->add_flag("--json", options->json, kJsonHelp);

@@ -95,7 +95,7 @@ std::uint64_t FrameReader::Count() {
 NCFRESULT FrameReader::Read(std::uint64_t frame) {
     request_->Ask(track_.number, frame, 1);
     const NCFRESULT result = essence_.provider().ProvideSampleRange(request_.get(), 0);
-    // A picture that may not be read comes back without a failure by sign.
+    // A picture that may not be read comes back with a result that is no failure.
     const bool isWhole =
         request_->buffer().isComplete() && request_->buffer().validBytes() == frameBytes_;
     return result == NCF_OK && !isWhole ? NCF_E_FAIL : result;

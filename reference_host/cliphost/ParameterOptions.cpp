@@ -14,7 +14,7 @@ void ParameterOptions::AddTo(CLI::App& verb) {
         ->allow_extra_args(false)
         ->group(group);
     verb.add_option("--set-xml", document_, "Values from a parameter document")->group(group);
-    verb.add_flag("--reset", reset_, "Go back to what the file says, before any --set")
+    verb.add_flag("--reset", reset_, "First go back to what the file says, then apply --set")
         ->group(group);
 }
 

@@ -225,8 +225,9 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
         app.add_subcommand("samples", "Show where the samples of a movie are in its file");
     verb->footer(
         "Example: cliphost samples clip.mov --track 0 --json\n"
-        "Samples are listed in decode order. The offset says how many samples later in this "
-        "order the one\nis stored that is displayed at this place. Totals that do not agree with "
+        "Samples are listed in decode order. The offset leads to the sample that is displayed at "
+        "this "
+        "place:\nso many samples later in the list. Totals that do not agree with "
         "the file give exit status 1.");
     auto options = std::make_shared<SamplesOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();

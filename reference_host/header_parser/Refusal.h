@@ -16,7 +16,7 @@ class HeaderBytes;
 // Why the header of a file was refused, and where.
 struct Refusal {
     NCFRESULT code = NCF_OK;               // fine for none
-    std::string reason = {};               // in words, with the numbers that tell
+    std::string reason = {};               // a sentence, with its numbers
     std::string atom = {};                 // as in "moov/trak/mdia/minf/stbl/stsz"; empty for none
     ncfUInt32 track = 0;                   // in the order of the file, from 1; 0 for none
     std::optional<ncfUInt64> offset = {};  // of the atom

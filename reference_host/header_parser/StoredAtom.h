@@ -22,7 +22,7 @@ struct StoredAtom {
     ncfUInt64 Size() const { return end - begin; }
 };
 
-// Walks atoms where they lie and steps over what they hold, so that the cost does
+// Walks atoms in place and steps over what they hold, so that the cost does
 // not grow with the media. Ends at the first that is no atom.
 class StoredAtoms {
 public:

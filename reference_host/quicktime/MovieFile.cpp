@@ -309,7 +309,7 @@ std::optional<double> MovieFile::RateOfTable(int stream) const {
                                       static_cast<double>(units));
 }
 
-// The same of a movie whose atoms can't be read where they lie. 0.0 where the
+// The same of a movie whose atoms can't be read in place. 0.0 where the
 // library does not tell both.
 double MovieFile::MeanRateOfMedia(int stream) const {
     const InputOwner whole = OpenForStream(path_, InputView::WholeMedia, stream);

@@ -98,11 +98,11 @@ public:
     AAFSmartPointerBase(T* object) : reference_(object) {}
 
     T* operator->() const {
-        T* const _rep = reference_.Get();
-        if (!_rep) {
+        T* const object = reference_.Get();
+        if (!object) {
             throw "_rep";
         }
-        return _rep;
+        return object;
     }
     operator T*() const { return reference_.Get(); }
     AAFOutArgument<T, Reference> operator&() { return AAFOutArgument<T, Reference>(reference_); }

@@ -170,8 +170,7 @@ NCFRESULT OtherClip::SetColorSpaceImpl() {
     picture_.color.refWhite = -1;
     ncfBool bYCbCr_709Found = 0;
     ncfBool bYCbCr_601Found = 0;
-    NCF_RETURN_TEXT("qtWrapper_->GetCodecColorSpaceInfo( &bYCbCr_709Found, &bYCbCr_601Found)",
-                    qtWrapper_->GetCodecColorSpaceInfo(&bYCbCr_709Found, &bYCbCr_601Found));
+    NCF_RETURN(qtWrapper_->GetCodecColorSpaceInfo( &bYCbCr_709Found, &bYCbCr_601Found));
     const ColorAnswer& answer =
         kColorAnswers[(bYCbCr_709Found ? 2 : 0) + (bYCbCr_601Found ? 1 : 0)];
     console_->Write(4, "%s", answer.line);

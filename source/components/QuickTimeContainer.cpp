@@ -49,7 +49,7 @@ NCFRESULT QuickTimeContainer::InternalQueryInterface(const GUID& iid, void** out
         this, iid, out);
 }
 
-// The one operation without a guard: a file that can't be opened is told by
+// Without a guard: a file that can't be opened is told by
 // the exception itself.
 NCFRESULT QuickTimeContainer::IsContainerSupported() {
     const NCFSmartPtr<INCFString> filePath = filePath_;

@@ -35,7 +35,7 @@ private:
     const PictureForm& form_;
     int width_;
     int height_;
-    // Lines read last, for each component; one number before and two behind.
+    // Lines read last, for each component; one number before and three behind.
     struct Line {
         int number = -1;
         std::vector<float> values;

@@ -9,7 +9,7 @@ namespace host {
 
 // Writes pictures whose numbers need no arithmetic, or hardly any, as the commonest
 // codecs deliver them. False, with nothing written, for other pictures. The results
-// equal those of PictureWriter's general conversion.
+// equal those of PictureWriter's conversion, but that codes beyond a layout's range stay.
 bool WriteDirectly(const AVFrame& frame, const PictureForm& form, PixelLayout layout,
                    std::uint8_t* to);
 

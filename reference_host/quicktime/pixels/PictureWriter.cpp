@@ -15,7 +15,7 @@
 namespace host {
 namespace {
 
-// Lines of plain numbers, each with room for what kernels read beyond it.
+// Lines of plain numbers.
 class Rows {
 public:
     explicit Rows(int width)

@@ -31,6 +31,11 @@ inline std::uint32_t Rounded(float value, float least, float most) {
     return static_cast<std::uint32_t>(static_cast<std::int32_t>(Within(value, least, most) + 0.5f));
 }
 
+// A file may hold more than ten bits in a word of ten.
+inline std::uint32_t ThreeOf10(std::uint32_t low, std::uint32_t middle, std::uint32_t high) {
+    return (low & 0x3FF) | (middle & 0x3FF) << 10 | (high & 0x3FF) << 20;
+}
+
 inline std::uint32_t Swapped16(std::uint32_t value) {
     return (value >> 8 | value << 8) & 0xFFFFu;
 }
@@ -195,10 +200,8 @@ void RoundRow(const float* __restrict from, float least, float most, int count,
 void StoreV210(const std::uint16_t* __restrict luma, const std::uint16_t* __restrict cb,
                const std::uint16_t* __restrict cr, int count, std::uint8_t* __restrict to) {
     const auto group = [&](const std::uint16_t* y, const std::uint16_t* u, const std::uint16_t* v) {
-        const std::uint32_t words[4] = {static_cast<std::uint32_t>(u[0] | y[0] << 10 | v[0] << 20),
-                                        static_cast<std::uint32_t>(y[1] | u[1] << 10 | y[2] << 20),
-                                        static_cast<std::uint32_t>(v[1] | y[3] << 10 | u[2] << 20),
-                                        static_cast<std::uint32_t>(y[4] | v[2] << 10 | y[5] << 20)};
+        const std::uint32_t words[4] = {ThreeOf10(u[0], y[0], v[0]), ThreeOf10(y[1], u[1], y[2]),
+                                        ThreeOf10(v[1], y[3], u[2]), ThreeOf10(y[4], v[2], y[5])};
         std::memcpy(to, words, sizeof words);
         to += sizeof words;
     };

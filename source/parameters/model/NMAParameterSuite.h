@@ -9,7 +9,7 @@
 
 namespace NMA::XMLUtils {
 
-// A whole parameter document. The name of its root is not looked at. Failures
+// A whole parameter document. The name of its root is ignored. Failures
 // are thrown as the views throw them; NMA_E_NOTINITIALIZED before a document is
 // loaded or a root made.
 class NMAParameterSuite : public NMAXmlDoc {

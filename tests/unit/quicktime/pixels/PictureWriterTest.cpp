@@ -357,4 +357,40 @@ TEST(PictureWriterOfFloats, WritesWhatIsNoNumberAsBlack) {
     EXPECT_TRUE(std::equal(std::begin(wanted), std::end(wanted), pixels));
 }
 
+host::FrameOwner FrameOf(AVPixelFormat format, int width, int height) {
+    host::FrameOwner frame(av_frame_alloc());
+    frame->format = format;
+    frame->width = width;
+    frame->height = height;
+    return av_frame_get_buffer(frame.get(), 0) < 0 ? nullptr : std::move(frame);
+}
+
+TEST(PictureWriterOfUnevenSteps, RefusesAFormatWhoseLumaStandsInUnevenSteps) {
+    const host::FrameOwner frame = FrameOf(AV_PIX_FMT_UYYVYY411, 64, 48);
+    ASSERT_TRUE(frame);
+    std::vector<std::uint8_t> pixels(64 * 48 * 4);
+    for (const PixelLayout layout : {PixelLayout::Uyvy8, PixelLayout::Bgra8}) {
+        EXPECT_FALSE(host::WritePicture(*frame, layout, 64, 48, pixels.data()));
+    }
+}
+
+TEST(PictureWriterOfLooseWords, LeavesOutWhatIsAboveTenBits) {
+    const host::FrameOwner frame = FrameOf(AV_PIX_FMT_YUV422P10LE, 6, 1);
+    ASSERT_TRUE(frame);
+    for (int plane = 0; plane < 3; ++plane) {
+        const std::uint16_t word = plane == 0 ? 0xFFFF : 0xFC00;
+        for (int x = 0; x < (plane == 0 ? 6 : 3); ++x) {
+            std::memcpy(frame->data[plane] + 2 * x, &word, 2);
+        }
+    }
+    std::uint8_t pixels[128] = {};
+    ASSERT_TRUE(host::WritePicture(*frame, PixelLayout::Yuv10, 6, 1, pixels));
+    std::uint32_t words[4] = {};
+    std::memcpy(words, pixels, sizeof words);
+    EXPECT_EQ(words[0], 0x3FFu << 10);
+    EXPECT_EQ(words[1], 0x3FFu | 0x3FFu << 20);
+    EXPECT_EQ(words[2], 0x3FFu << 10);
+    EXPECT_EQ(words[3], 0x3FFu | 0x3FFu << 20);
+}
+
 }  // namespace
