@@ -9,6 +9,8 @@
 #include <cstdio>
 #include <map>
 
+#include "benchmarks/support/ColdFiles.h"
+
 namespace {
 
 // Keeps the wall time of every run, by name and arguments, beside printing it.
@@ -35,6 +37,7 @@ double Median(std::vector<double> values) {
 }  // namespace
 
 int RunWithRatios(int argc, char** argv, const std::vector<Pair>& pairs) {
+    TakeColdOption(&argc, argv);
     benchmark::Initialize(&argc, argv);
     if (benchmark::ReportUnrecognizedArguments(argc, argv)) {
         return 2;
