@@ -14,11 +14,12 @@ namespace NMA::Impl {
 // in it, else empty.
 std::u16string VolumeRootOf(const std::u16string& path);
 
-// Reads a file without the system's cache, for callers that read a few places of
-// it once. Such reads must start and end at sector borders of the volume and go to
-// an aligned address; this class hides that from its callers. The
-// file is opened by the first operation that needs it, which throws
-// NCF_E_HANDLE when that fails. One object belongs to one thread.
+// Reads a few places of a file and brings nothing else of it into the system's
+// cache. On Windows that means reads past the cache, which must start and end at
+// sector borders of the volume and go to an aligned address. This class hides that
+// from its callers, and reads so on every system. The file is opened by the first
+// operation that needs it, which throws NCF_E_HANDLE when that fails. One object
+// belongs to one thread.
 class SimpleFileIO {
 public:
     // Takes a copy of the path, which is borrowed; doesn't touch the file.

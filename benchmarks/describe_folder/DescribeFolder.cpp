@@ -13,6 +13,7 @@
 #include <filesystem>
 
 #include "benchmarks/support/Brief.h"
+#include "benchmarks/support/ColdFiles.h"
 #include "benchmarks/support/Ratios.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/Describe.h"
@@ -75,6 +76,7 @@ void DescribeFolder(benchmark::State& state) {
         std::filesystem::read_symlink("/proc/self/exe").parent_path().parent_path();
     cliphost::Session session(options);
     for (auto _ : state) {
+        MakeFolderCold(state, Folder().Path());
         const cliphost::FolderClips clips(session, Folder().Path());
         for (const cliphost::FolderClip& clip : clips.clips()) {
             const auto description =
@@ -92,6 +94,7 @@ void DescribeFolder(benchmark::State& state) {
 void OpenAndFindStreams(benchmark::State& state) {
     av_log_set_level(AV_LOG_QUIET);
     for (auto _ : state) {
+        MakeFolderCold(state, Folder().Path());
         for (const auto& entry : std::filesystem::directory_iterator(Folder().Path())) {
             AVFormatContext* context = nullptr;
             if (avformat_open_input(&context, entry.path().c_str(), nullptr, nullptr) < 0 ||

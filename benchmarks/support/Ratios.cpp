@@ -7,7 +7,10 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <cstdlib>
 #include <map>
+
+#include "benchmarks/support/ColdFiles.h"
 
 namespace {
 
@@ -83,7 +86,10 @@ Verdict Judge(const Goal& goal, const Measured& ours, const Measured& peer) {
 
 void PrintRow(const std::string& work, const Pair& pair, const Measured& ours,
               const Measured* peer) {
-    const Verdict verdict = Judge(pair.goal, ours, peer ? *peer : Measured{1, 0});
+    const std::size_t place = work.find_last_of(" :");
+    const bool isHeld = pair.from == 0 || (place != std::string::npos &&
+                                           std::atoll(work.c_str() + place + 1) >= pair.from);
+    const Verdict verdict = Judge(isHeld ? pair.goal : NoGoal, ours, peer ? *peer : Measured{1, 0});
     std::printf("| %s | %s | %s | %s | %s | %s | %s |\n", work.c_str(), pair.peer.c_str(),
                 peer ? Duration(peer->seconds).c_str() : "", Duration(ours.seconds).c_str(),
                 verdict.ratio.c_str(), verdict.wanted.c_str(),
@@ -95,6 +101,7 @@ void PrintRow(const std::string& work, const Pair& pair, const Measured& ours,
 }  // namespace
 
 int RunWithRatios(int argc, char** argv, const std::vector<Pair>& pairs) {
+    TakeColdOption(&argc, argv);
     benchmark::Initialize(&argc, argv);
     if (benchmark::ReportUnrecognizedArguments(argc, argv)) {
         return 2;

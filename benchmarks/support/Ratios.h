@@ -38,6 +38,7 @@ struct Pair {
     std::string ours;
     std::string peer;
     Goal goal;
+    long long from = 0;  // smaller arguments are only told
 };
 
 // Runs the registered benchmarks, prints them as usual, and behind them a row of a table for

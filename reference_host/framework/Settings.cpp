@@ -51,7 +51,9 @@ NCFRESULT Settings::GetNamedSetting(const ncfUTF8* key, ncfUInt32* value, ncfUIn
         Need(key && value);
         const std::lock_guard<std::mutex> guard(mutex_);
         const auto found = named_.find(key);
-        Need(found != named_.end(), NCF_E_PARAMETERNOTAVAILABLE);
+        if (found == named_.end()) {
+            return NCF_E_PARAMETERNOTAVAILABLE;
+        }
         *value = found->second;
         return NCF_OK;
     });

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <array>
 #include <filesystem>
 #include <fstream>
 
@@ -23,7 +24,8 @@ private:
     virtual bool ReadInside(ncfUInt64 position, ncfUInt8* to, ncfUInt64 size) = 0;
 };
 
-// Those of a file; none of one that can't be read.
+// Those of a file; none of one that can't be read. Small reads near each other cost one
+// call of the system: most headers are no longer than what is kept.
 class FileBytes final : public ByteSource {
 public:
     explicit FileBytes(const std::filesystem::path& path);
@@ -31,9 +33,13 @@ public:
 
 private:
     bool ReadInside(ncfUInt64 position, ncfUInt8* to, ncfUInt64 size) override;
+    bool ReadFile(ncfUInt64 position, ncfUInt8* to, ncfUInt64 size);
 
     std::ifstream stream_;
     ncfUInt64 length_ = 0;
+    std::array<ncfUInt8, 4096> kept_;  // `keptSize_` bytes from `keptBegin_`
+    ncfUInt64 keptBegin_ = 0;
+    ncfUInt64 keptSize_ = 0;
 };
 
 // Those of a header that was unpacked.

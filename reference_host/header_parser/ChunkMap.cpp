@@ -122,8 +122,10 @@ Verdict ChunkMap::WalkChunks(const Atom& offsets, const SampleSizes& sizes,
     ncfUInt32 lastDescription = 0;
     for (ncfUInt32 run = 0; run < runCount_; ++run) {
         const ncfUInt32 description = Description(run);
-        for (ncfUInt32 chunk = FirstChunk(run); chunk < EndChunk(run); ++chunk) {
-            const ncfUInt32 count = std::min(SamplesPerChunk(run), sampleCount_ - sample);
+        const ncfUInt32 perChunk = SamplesPerChunk(run);
+        const ncfUInt32 endChunk = EndChunk(run);
+        for (ncfUInt32 chunk = FirstChunk(run); chunk < endChunk; ++chunk) {
+            const ncfUInt32 count = std::min(perChunk, sampleCount_ - sample);
             const ncfUInt64 position = PositionOf(chunk);
             const ncfUInt64 size = sizes.BytesOf(sample, count);
             if (position > kMaxPosition || size > kMaxPosition - position) {

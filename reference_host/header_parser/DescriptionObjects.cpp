@@ -20,7 +20,9 @@ NCFRESULT GiveText(const Atom& atom, INCFString** out) {
     return Guarded([&] {
         Need(out);
         *out = nullptr;
-        Need(atom, NCF_E_PARAMETERNOTAVAILABLE);
+        if (!atom) {
+            return NCF_E_PARAMETERNOTAVAILABLE;
+        }
         const std::string_view all(reinterpret_cast<const char*>(atom.begin),
                                    static_cast<std::size_t>(atom.Size()));
         return host::GiveString(all.substr(0, all.find('\0')), out);

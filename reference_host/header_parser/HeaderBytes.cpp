@@ -10,7 +10,7 @@
 namespace header_parser {
 
 ncfUInt64 HeaderBytes::NextCapacity(ncfUInt64 needed) const {
-    return std::max({needed, size_ * 2, std::min(expected_, size_ * 16)});
+    return std::max({needed, size_ * 2, std::min(expected_, size_ * 256)});
 }
 
 ncfUInt8* HeaderBytes::Room(ncfUInt64 count) {

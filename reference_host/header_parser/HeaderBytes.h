@@ -12,7 +12,8 @@ namespace header_parser {
 // The bytes of the movie header, gathered piece by piece and kept once. The
 // tables are read in place, so nothing is appended any more once they are in
 // use. A large header grows in few steps, towards what its atom claims but
-// never past sixteen times what was really given.
+// never past 256 times what was really given; memory that is not written to costs
+// nothing.
 class HeaderBytes {
 public:
     const ncfUInt8* begin() const { return bytes_.get(); }

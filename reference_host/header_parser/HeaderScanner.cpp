@@ -16,6 +16,9 @@ namespace {
 
 constexpr ncfUInt64 kMaxPosition = static_cast<ncfUInt64>(std::numeric_limits<ncfSInt64>::max());
 
+// A multiple of what any disk reads at once.
+constexpr ncfUInt64 kSector = 4096;
+
 // What may open a file of this family. Behind that, other types are passed
 // over as long as they are text.
 constexpr ncfUInt32 kOpeningAtoms[] = {
@@ -61,10 +64,16 @@ struct HeaderScanner::Range {
     ncfUInt64 Left() const { return static_cast<ncfUInt64>(end - at); }
 };
 
+// A long range is asked for in pieces that end where sectors do: such reads need no
+// copy.
 Verdict HeaderScanner::Want(ncfUInt64 position, ncfUInt64 size) {
     isWaiting_ = true;
     wantedPosition_ = position;
-    wantedSize_ = static_cast<ncfUInt32>(std::min<ncfUInt64>(size, limits_.maxReadSize));
+    if (size > limits_.maxReadSize) {
+        const ncfUInt64 odd = (position + limits_.maxReadSize) % kSector;
+        size = limits_.maxReadSize - (odd < limits_.maxReadSize ? odd : 0);
+    }
+    wantedSize_ = static_cast<ncfUInt32>(size);
     return Fine();
 }
 

@@ -13,6 +13,47 @@ namespace {
 constexpr ncfUInt32 kStep = 64;  // samples between two marks: 8 bytes for 256 of the table
 }
 
+template <class Visit>
+auto SampleSizes::WithEntries(Visit visit) const {
+    const ncfUInt8* const entries = entries_;
+    switch (entryBits_) {
+        case 4:
+            return visit([entries](ncfUInt32 sample) -> ncfUInt32 {
+                return sample % 2 == 0 ? entries[sample / 2] >> 4 : entries[sample / 2] & 0xF;
+            });
+        case 8:
+            return visit([entries](ncfUInt32 sample) -> ncfUInt32 { return entries[sample]; });
+        case 16:
+            return visit([entries](ncfUInt32 sample) -> ncfUInt32 {
+                return LoadU16(entries + ncfUInt64{2} * sample);
+            });
+        default:
+            return visit(
+                [entries](ncfUInt32 sample) { return LoadU32(entries + ncfUInt64{4} * sample); });
+    }
+}
+
+// Over all entries: their width is settled before the loop, not within it.
+template <class EntryAt>
+void SampleSizes::Mark(EntryAt entryAt) {
+    marks_.reserve(count_ / kStep + 1);
+    ncfUInt64 sum = 0;
+    ncfUInt32 smallest = std::numeric_limits<ncfUInt32>::max();
+    ncfUInt32 largest = 0;
+    for (ncfUInt32 sample = 0; sample < count_;) {
+        marks_.push_back(sum);
+        const ncfUInt32 end = sample + std::min(kStep, count_ - sample);
+        for (; sample < end; ++sample) {
+            const ncfUInt32 size = entryAt(sample);
+            sum += size;
+            smallest = std::min(smallest, size);
+            largest = std::max(largest, size);
+        }
+    }
+    smallest_ = count_ == 0 ? 0 : smallest;
+    largest_ = largest;
+}
+
 Verdict SampleSizes::Read(const Atom& stsz, const Atom& stz2) {
     if (!stsz && !stz2) {
         return Broken("it lacks 'stsz', the sample sizes");
@@ -43,24 +84,8 @@ Verdict SampleSizes::Read(const Atom& stsz, const Atom& stz2) {
     if ((ncfUInt64{count_} * entryBits_ + 7) / 8 > reader.Left()) {
         return ClaimsTooMany(atom, count_, reader.Left());
     }
-    Mark();
+    WithEntries([this](auto entryAt) { Mark(entryAt); });
     return Fine();
-}
-
-void SampleSizes::Mark() {
-    marks_.reserve(count_ / kStep + 1);
-    ncfUInt64 sum = 0;
-    smallest_ = count_ == 0 ? 0 : std::numeric_limits<ncfUInt32>::max();
-    for (ncfUInt32 start = 0; start < count_; start += std::min(kStep, count_ - start)) {
-        marks_.push_back(sum);
-        const ncfUInt32 end = start + std::min(kStep, count_ - start);
-        for (ncfUInt32 sample = start; sample < end; ++sample) {
-            const ncfUInt32 size = Entry(sample);
-            sum += size;
-            smallest_ = std::min(smallest_, size);
-            largest_ = std::max(largest_, size);
-        }
-    }
 }
 
 void SampleSizes::UsePackets(const PacketLayout& layout) {
@@ -69,31 +94,17 @@ void SampleSizes::UsePackets(const PacketLayout& layout) {
 }
 
 ncfUInt32 SampleSizes::Entry(ncfUInt32 sample) const {
-    switch (entryBits_) {
-        case 4:
-            return sample % 2 == 0 ? entries_[sample / 2] >> 4 : entries_[sample / 2] & 0xF;
-        case 8:
-            return entries_[sample];
-        case 16:
-            return LoadU16(entries_ + ncfUInt64{2} * sample);
-        default:
-            return LoadU32(entries_ + ncfUInt64{4} * sample);
-    }
+    return WithEntries([sample](auto entryAt) { return entryAt(sample); });
 }
 
 ncfUInt64 SampleSizes::Sum(ncfUInt32 from, ncfUInt32 to) const {
-    ncfUInt64 sum = 0;
-    if (entryBits_ == 32) {
-        for (const ncfUInt8* at = entries_ + ncfUInt64{4} * from;
-             at != entries_ + ncfUInt64{4} * to; at += 4) {
-            sum += LoadU32(at);
+    return WithEntries([from, to](auto entryAt) {
+        ncfUInt64 sum = 0;
+        for (ncfUInt32 sample = from; sample < to; ++sample) {
+            sum += entryAt(sample);
         }
         return sum;
-    }
-    for (; from < to; ++from) {
-        sum += Entry(from);
-    }
-    return sum;
+    });
 }
 
 ncfUInt32 SampleSizes::SizeOf(ncfUInt32 sample) const {

@@ -39,7 +39,11 @@ public:
     ncfUInt64 BytesOf(ncfUInt32 first, ncfUInt32 count) const;
 
 private:
-    void Mark();
+    template <class EntryAt>
+    void Mark(EntryAt entryAt);
+    // Calls visit(entryAt), which reads entries of the table's width.
+    template <class Visit>
+    auto WithEntries(Visit visit) const;
     ncfUInt32 Entry(ncfUInt32 sample) const;
     ncfUInt64 Sum(ncfUInt32 from, ncfUInt32 to) const;
 

@@ -32,14 +32,9 @@ Verdict SampleTimes::Read(const Atom& durations, const Atom& offsets, ncfUInt32 
     if (sampleCount == 0) {
         return Fine();
     }
-    Verdict verdict = ReadDurations(durations);
-    if (!verdict.Refused() && offsets) {
-        verdict = ReadOffsets(offsets);
-    }
-    if (!verdict.Refused()) {
-        MeasureDisplay();
-    }
-    return verdict;
+    const Verdict verdict = ReadDurations(durations);
+    displayEnd_ = total_;
+    return !verdict.Refused() && offsets ? ReadOffsets(offsets) : verdict;
 }
 
 Verdict SampleTimes::ReadDurations(const Atom& atom) {
@@ -71,48 +66,125 @@ Verdict SampleTimes::ReadDurations(const Atom& atom) {
     return sample == sampleCount_ ? Fine() : CountsOther(atom, sample, sampleCount_);
 }
 
+// Walks the samples in the order in which they are decoded, in steps of samples that
+// share a duration, and keeps where those steps are shown.
+class SampleTimes::DisplayWalk {
+public:
+    explicit DisplayWalk(const SampleTimes& times) : at_(times.durations_) {}
+
+    // The samples of one offset. No more than the durations count.
+    void Take(ncfUInt32 count, ncfSInt32 offset) {
+        if (count > 0) {
+            extent_.minOffset = std::min(extent_.minOffset, offset);
+            extent_.maxOffset = std::max(extent_.maxOffset, offset);
+        }
+        while (count > 0) {
+            const ncfUInt32 step = std::min(count, Alike());
+            extent_.first = std::min(extent_.first, time_ + offset);
+            Step(step);
+            extent_.end = std::max(extent_.end, time_ + offset);
+            count -= step;
+        }
+    }
+
+    // The samples of `kStep` entries at once, if all have one duration and there are no
+    // more than `left`; else false, and nothing is taken. The sums of entries that don't
+    // fit may wrap.
+    bool TakeEntries(const ncfUInt8* offsets, ncfUInt32& left) {
+        const ncfUInt32 most = std::min(Alike(), left);
+        Extent extent = extent_;
+        ncfUInt64 samples = 0;
+        bool hasEmpty = false;
+        auto time = static_cast<ncfUInt64>(time_);
+        for (ncfUInt32 i = 0; i < kStep; ++i) {
+            const ncfUInt64 entry = LoadU64(offsets + std::size_t{8} * i);
+            const ncfUInt64 count = entry >> 32;
+            const auto offset = static_cast<ncfSInt32>(static_cast<ncfUInt32>(entry));
+            const auto shift = static_cast<ncfUInt64>(ncfSInt64{offset});
+            hasEmpty |= count == 0;
+            samples += count;
+            extent.minOffset = std::min(extent.minOffset, offset);
+            extent.maxOffset = std::max(extent.maxOffset, offset);
+            extent.first = std::min(extent.first, static_cast<ncfSInt64>(time + shift));
+            time += count * duration_;
+            extent.end = std::max(extent.end, static_cast<ncfSInt64>(time + shift));
+        }
+        if (hasEmpty || samples > most) {
+            return false;
+        }
+        extent_ = extent;
+        Step(static_cast<ncfUInt32>(samples));
+        left -= static_cast<ncfUInt32>(samples);
+        return true;
+    }
+
+    struct Extent {
+        ncfSInt64 first = std::numeric_limits<ncfSInt64>::max();
+        ncfSInt64 end = std::numeric_limits<ncfSInt64>::min();
+        ncfSInt32 minOffset = std::numeric_limits<ncfSInt32>::max();
+        ncfSInt32 maxOffset = std::numeric_limits<ncfSInt32>::min();
+    };
+    const Extent& Shown() const { return extent_; }
+
+private:
+    // How many of the next samples share a duration. There must be one more.
+    ncfUInt32 Alike() {
+        for (; alike_ == 0; at_ += 8) {
+            alike_ = LoadU32(at_);
+            duration_ = LoadU32(at_ + 4);
+        }
+        return alike_;
+    }
+    void Step(ncfUInt32 samples) {
+        alike_ -= samples;
+        time_ += ncfSInt64{samples} * duration_;
+    }
+
+    const ncfUInt8* at_;  // the next entry of the durations
+    ncfUInt32 alike_ = 0;
+    ncfUInt32 duration_ = 0;
+    ncfSInt64 time_ = 0;
+    Extent extent_;
+};
+
+// One walk over both tables, which may be longer than the processor's caches. Among
+// samples that share duration and offset the display times rise, so the first and the
+// last are all that matters.
 Verdict SampleTimes::ReadOffsets(const Atom& atom) {
     Verdict verdict = OpenTable(atom, 8, offsets_, offsetEntries_);
     if (verdict.Refused()) {
         return verdict;
     }
     offsetMarks_.reserve(offsetEntries_ / kStep + 1);
-    ncfUInt64 sample = 0;
-    for (ncfUInt32 entry = 0; entry < offsetEntries_; ++entry) {
+    DisplayWalk walk(*this);
+    ncfUInt32 left = sampleCount_;
+    for (ncfUInt32 entry = 0; entry < offsetEntries_;) {
         if (entry % kStep == 0) {
-            offsetMarks_.push_back(static_cast<ncfUInt32>(sample));
+            offsetMarks_.push_back(sampleCount_ - left);
+            if (left > 0 && offsetEntries_ - entry >= kStep &&
+                walk.TakeEntries(offsets_ + std::size_t{8} * entry, left)) {
+                entry += kStep;
+                continue;
+            }
         }
-        sample += OffsetCount(entry);
-        if (sample > sampleCount_) {
-            return CountsOther(atom, sample, sampleCount_);
+        const ncfUInt32 count = OffsetCount(entry);
+        if (count > left) {
+            return CountsOther(atom, ncfUInt64{sampleCount_} - left + count, sampleCount_);
         }
+        walk.Take(count, Offset(entry));
+        left -= count;
+        ++entry;
     }
-    return sample == sampleCount_ ? Fine() : CountsOther(atom, sample, sampleCount_);
-}
-
-// One walk over the runs of both tables. Within a stretch the display times
-// rise, so its ends are all that matters.
-void SampleTimes::MeasureDisplay() {
-    displayEnd_ = total_;
-    if (offsets_ == nullptr) {
-        return;
+    if (left > 0) {
+        return CountsOther(atom, sampleCount_ - left, sampleCount_);
     }
-    ncfSInt64 first = std::numeric_limits<ncfSInt64>::max();
-    ncfSInt64 end = std::numeric_limits<ncfSInt64>::min();
-    minOffset_ = std::numeric_limits<ncfSInt32>::max();
-    maxOffset_ = std::numeric_limits<ncfSInt32>::min();
-    ForEachStretch(0, [&](const Stretch& stretch) {
-        const ncfSInt64 shown = static_cast<ncfSInt64>(stretch.decodeTime) + stretch.offset;
-        first = std::min(first, shown);
-        end = std::max(end,
-                       shown + static_cast<ncfSInt64>(ncfUInt64{stretch.count} * stretch.duration));
-        minOffset_ = std::min(minOffset_, stretch.offset);
-        maxOffset_ = std::max(maxOffset_, stretch.offset);
-        return true;
-    });
-    shift_ = first;
-    displayEnd_ = static_cast<ncfUInt64>(end - first);
+    const DisplayWalk::Extent& shown = walk.Shown();
+    minOffset_ = shown.minOffset;
+    maxOffset_ = shown.maxOffset;
+    shift_ = shown.first;
+    displayEnd_ = static_cast<ncfUInt64>(shown.end - shown.first);
     isReordered_ = minOffset_ != shift_ || maxOffset_ != shift_;
+    return Fine();
 }
 
 SampleTimes::DurationRun SampleTimes::DurationRunOf(ncfUInt32 sample) const {

@@ -65,6 +65,7 @@ private:
         ncfUInt32 first;
         ncfUInt64 decodeTime;
     };
+    class DisplayWalk;
     struct OffsetRun {
         ncfUInt32 entry;
         ncfUInt32 first;
@@ -72,7 +73,6 @@ private:
 
     Verdict ReadDurations(const Atom& atom);
     Verdict ReadOffsets(const Atom& atom);
-    void MeasureDisplay();
     DurationRun DurationRunOf(ncfUInt32 sample) const;
     OffsetRun OffsetRunOf(ncfUInt32 sample) const;
     ncfUInt32 SampleDecodedAt(ncfUInt64 time) const;

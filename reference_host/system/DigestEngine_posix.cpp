@@ -10,9 +10,16 @@ struct DigestEngine::Handle {
     EVP_MD_CTX* context = nullptr;
 };
 
+// Found once for the process: the library searches its providers for each name. Like
+// the library itself it stays until the end.
+static const EVP_MD* Sha256() {
+    static const EVP_MD* const digest = EVP_MD_fetch(nullptr, "SHA256", nullptr);
+    return digest;
+}
+
 DigestEngine::DigestEngine() : handle_(std::make_unique<Handle>()) {
     EVP_MD_CTX* context = EVP_MD_CTX_new();
-    if (context != nullptr && EVP_DigestInit_ex(context, EVP_sha256(), nullptr) != 1) {
+    if (context != nullptr && EVP_DigestInit_ex(context, Sha256(), nullptr) != 1) {
         EVP_MD_CTX_free(context);
         context = nullptr;
     }

@@ -91,7 +91,7 @@ NCFRESULT Description::SetRateAndLength() {
 }
 
 NCFRESULT Description::IdentifyMobs() {
-    std::vector<ncfUInt8> pContent;
+    ByteVector pContent;
     NCF_RETURN(media->GetContentForHash(pContent));
     showsAlpha = media->ShowsAlpha();
 

@@ -3,12 +3,12 @@
 #pragma once
 
 #include <tr1/memory>
-#include <vector>
 
 #include "source/clips/ClipRecords.h"
 #include "source/clips/MovieServices.h"
 #include "source/clips/PictureFacts.h"
 #include "source/clips/SampleProviderRule.h"
+#include "source/plugin/ByteVector.h"
 
 struct AAFInfo;
 
@@ -55,7 +55,7 @@ public:
     // 17. A person's name for a codec, in a new string.
     virtual NCFRESULT GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) = 0;
     // 18. Bytes of the file that tell this movie from others.
-    virtual NCFRESULT GetContentForHash(std::vector<ncfUInt8>& content) = 0;
+    virtual NCFRESULT GetContentForHash(ByteVector& content) = 0;
     // 19. The flag itself, or a negative failure.
     virtual NCFRESULT IsSelfContained() = 0;
     // 20. 1 native, 0 to be served by the sample provider, negative failure.

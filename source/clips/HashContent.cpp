@@ -13,9 +13,10 @@ namespace {
 // Largest range that one read can fetch.
 constexpr ncfUInt64 kLargestRead = 0xFFFFFFFF;
 
-// A long range is read in pieces of this size: the reader holds what it reads a
-// second time.
-constexpr ncfUInt32 kPiece = 4 * kHashChunkSize;
+// A longer range than a track's is the movie header, which is in the system's cache
+// since it was parsed. It is read in pieces that the processor's cache holds: each is
+// copied from the reader's memory.
+constexpr ncfUInt32 kPiece = kHashChunkSize / 4;
 
 // Whether pieces come out as one read would.
 bool IsInside(NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt32 size) {
@@ -26,7 +27,7 @@ bool IsInside(NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt32 
 NCFRESULT ReadWhole(const char* ncfFunction, const char* statement,
                     NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt32 size,
                     ncfUInt8* bytes) {
-    const bool inPieces = size > kPiece && IsInside(file_reader, offset, size);
+    const bool inPieces = size > kHashChunkSize && IsInside(file_reader, offset, size);
     const ncfUInt32 most = inPieces ? kPiece : size;
     for (ncfUInt32 done = 0; done < size;) {
         const ncfUInt32 wanted = std::min(most, size - done);
@@ -47,13 +48,13 @@ constexpr std::size_t kRoomForTracks = 4 * kHashChunkSize;
 // The first range is the movie header. A long one must not be moved for what the
 // tracks add, since both copies would be held meanwhile. So it gets as much room
 // again: where the tracks fill that too, they are most of the content.
-std::size_t NextCapacity(const std::vector<ncfUInt8>& content, std::size_t needed) {
+std::size_t NextCapacity(const ByteVector& content, std::size_t needed) {
     return content.empty() ? 2 * needed + kRoomForTracks : std::max(needed, 2 * content.capacity());
 }
 
 // How much of the content is good, however the reading ends.
 struct Kept {
-    std::vector<ncfUInt8>& content;
+    ByteVector& content;
     std::size_t size;
 
     ~Kept() { content.resize(size); }
@@ -63,7 +64,7 @@ struct Kept {
 
 NCFRESULT AppendFileRange(const char* function, const char* statement,
                           NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt64 size,
-                          std::vector<ncfUInt8>& content) {
+                          ByteVector& content) {
     if (size == 0) {
         return NCF_OK;
     }

@@ -2,9 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <vector>
-
 #include "public_include/SimpleFileIO.h"
+#include "source/plugin/ByteVector.h"
 
 // Pieces of a file that tell a movie from others, for both kinds of clip.
 
@@ -16,4 +15,4 @@ inline constexpr ncfUInt64 kHashChunkSize = 1048576;
 // failed read is logged under the function's name as `statement`.
 NCFRESULT AppendFileRange(const char* function, const char* statement,
                           NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset, ncfUInt64 size,
-                          std::vector<ncfUInt8>& content);
+                          ByteVector& content);

@@ -39,7 +39,7 @@ public:
     }
     NCFRESULT GetCreationTime(ncfUInt64* creationTime) override;
     NCFRESULT GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) override;
-    NCFRESULT GetContentForHash(std::vector<ncfUInt8>& pContent) override;
+    NCFRESULT GetContentForHash(ByteVector& pContent) override;
     NCFRESULT IsSelfContained() override;
     NCFRESULT IsVideoSampleProviderMedia(AAFInfo* outAAFInfo) override;
     NCFRESULT HasOneFrame(ncfBool* isOneFrame) override;

@@ -14,7 +14,7 @@
 #include "source/clips/OtherClip.h"
 #include "source/plugin/ResultChecks.h"
 
-NCFRESULT OtherClip::GetContentForHash(std::vector<ncfUInt8>& pContent) {
+NCFRESULT OtherClip::GetContentForHash(ByteVector& pContent) {
     NCF_FUNCTION("OtherClip::GetContentForHash");
     pContent.clear();
     NCFSmartPtr<QTWrapper::IQuickTimeWrapper> qtWrapper;

@@ -45,7 +45,7 @@ public:
     }
     NCFRESULT GetCreationTime(ncfUInt64* creationTime) override;
     NCFRESULT GetCodecName(ncfUInt32 codecType, NCFSmartPtr<INCFString>& codecName) override;
-    NCFRESULT GetContentForHash(std::vector<ncfUInt8>& content) override;
+    NCFRESULT GetContentForHash(ByteVector& content) override;
     NCFRESULT IsSelfContained() override;
     NCFRESULT IsVideoSampleProviderMedia(AAFInfo* aafInfo) override;
     NCFRESULT HasOneFrame(ncfBool* isOneFrame) override;

@@ -14,14 +14,14 @@
 namespace {
 
 NCFRESULT AppendRange(const char* function, NMA::Impl::SimpleFileIO& file_reader, ncfUInt64 offset,
-                      ncfUInt64 size, std::vector<ncfUInt8>& content) {
+                      ncfUInt64 size, ByteVector& content) {
     return AppendFileRange(function, "file_reader.Read(offset, &local[0], size, &actualRead)",
                            file_reader, offset, size, content);
 }
 
 }  // namespace
 
-NCFRESULT QuickTimeClip::GetContentForHash(std::vector<ncfUInt8>& content) {
+NCFRESULT QuickTimeClip::GetContentForHash(ByteVector& content) {
     NCF_FUNCTION("QuickTimeClip::GetContentForHash");
     content.clear();
     NMA::Impl::SimpleFileIO file_reader(fileName_.inArg());

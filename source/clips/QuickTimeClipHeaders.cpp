@@ -4,17 +4,29 @@
 // From the file's bytes to the map of tracks.
 
 #include <cstring>
+#include <new>
 #include <tr1/memory>
 
 #include "public_include/SimpleFileIO.h"
 #include "source/clips/QuickTimeClip.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/os/Os.h"
 
 namespace {
 
 // Enough to see where the movie header stands.
 constexpr ncfUInt32 kFirstReadSize = 4096;
+
+// Memory that whole sectors are read into without a copy.
+std::tr1::shared_ptr<ncfUInt8> MakeReadBuffer(ncfUInt32 size) {
+    constexpr std::size_t kSector = 4096;
+    auto* const bytes = static_cast<ncfUInt8*>(os::AllocateAligned(size, kSector));
+    if (!bytes) {
+        throw std::bad_alloc();
+    }
+    return std::tr1::shared_ptr<ncfUInt8>(bytes, os::FreeAligned);
+}
 
 }  // namespace
 
@@ -35,7 +47,7 @@ NCFRESULT QuickTimeClip::ParseMediaHeaders() {
     while (result != NCF_OK) {
         if (capacity < readSize) {
             outputBuffer.reset();
-            outputBuffer.reset(new ncfUInt8[readSize], [](ncfUInt8* bytes) { delete[] bytes; });
+            outputBuffer = MakeReadBuffer(readSize);
             capacity = readSize;
         }
         ncfUInt32 bytesRead = 0;

@@ -3,14 +3,7 @@
 
 #include "source/descriptor_data/GenericXMLDataContainer.h"
 
-#include <cstring>
-
 #include "source/plugin/ResultChecks.h"
-
-bool GenericXMLDataContainer::KeyLess::operator()(const XMLDataPropertyValue* left,
-                                                  const XMLDataPropertyValue* right) const {
-    return std::strcmp(left->ValueText(), right->ValueText()) < 0;
-}
 
 GenericXMLDataContainer::GenericXMLDataContainer() = default;
 GenericXMLDataContainer::~GenericXMLDataContainer() = default;
@@ -92,10 +85,7 @@ void GenericXMLDataContainer::Attribute(const NMAString& name, const NMAString& 
 
 void GenericXMLDataContainer::GetEntries(const char* key,
                                          std::vector<XMLDataPropertyValue*>* entries) const {
-    const XMLDataPropertyDescription description(NMAString("DummyProperty"), DCF_KEY_ELEMENT);
-    XMLDataPropertyValue keyNode(&description);
-    keyNode.SetValue(NMAString(key));
-    const auto range = entries_.equal_range(&keyNode);
+    const auto range = entries_.equal_range(key);
     for (auto entry = range.first; entry != range.second; ++entry) {
         entries->push_back(entry->second);
     }

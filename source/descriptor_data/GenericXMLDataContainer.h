@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstring>
 #include <map>
 #include <memory>
 #include <ostream>
@@ -50,7 +51,14 @@ public:
 
     // All entries in the order of their keys, as Dump shows them.
     struct KeyLess {
-        bool operator()(const XMLDataPropertyValue* left, const XMLDataPropertyValue* right) const;
+        using is_transparent = void;  // a search needs no key, only its text
+
+        template <class Left, class Right>
+        bool operator()(Left left, Right right) const {
+            return std::strcmp(TextOf(left), TextOf(right)) < 0;
+        }
+        static const char* TextOf(const char* text) { return text; }
+        static const char* TextOf(const XMLDataPropertyValue* key) { return key->ValueText(); }
     };
     using Entries = std::multimap<XMLDataPropertyValue*, XMLDataPropertyValue*, KeyLess>;
     const Entries& AllEntries() const { return entries_; }

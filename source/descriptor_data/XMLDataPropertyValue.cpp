@@ -14,6 +14,10 @@ XMLDataPropertyValue::XMLDataPropertyValue(const XMLDataPropertyDescription* des
     }
 }
 
+bool XMLDataPropertyValue::IsNamed(const char* property) const {
+    return std::strcmp(description_->NameText(), property) == 0;
+}
+
 NCFRESULT XMLDataPropertyValue::GetDesc(const XMLDataPropertyDescription** outDesc) const {
     NCF_FUNCTION("XMLDataPropertyValue::GetDesc");
     CHK_INARG(outDesc);
@@ -60,7 +64,7 @@ NCFRESULT XMLDataPropertyValue::FindNextProperty(const char* property,
     NCF_FUNCTION("XMLDataPropertyValue::FindNextProperty");
     CHK_INARG(dataPropertyValue);
     for (XMLDataPropertyValue* node = this; node; node = node->parent_) {
-        if (std::strcmp(node->description_->NameText(), property) == 0) {
+        if (node->IsNamed(property)) {
             *dataPropertyValue = node;
             return NCF_OK;
         }
@@ -77,11 +81,7 @@ NCFRESULT XMLDataPropertyValue::FindPropertyInChildren(
     CHK_INARG(dataPropertyValueVect);
     NCFRESULT result = kPropertyNotFound;
     for (XMLDataPropertyValue* child : children_) {
-        const XMLDataPropertyDescription* description = nullptr;
-        if (!child || child->GetDesc(&description) < 0 || !description) {
-            continue;
-        }
-        if (std::strcmp(description->NameText(), property) == 0) {
+        if (child->IsNamed(property)) {
             dataPropertyValueVect->push_back(child);
             result = NCF_OK;
         }
@@ -94,11 +94,11 @@ NCFRESULT XMLDataPropertyValue::FindPropertyInChildren(
     NCF_FUNCTION("XMLDataPropertyValue::FindPropertyInChildren");
     CHK_INARG(dataPropertyValue);
     *dataPropertyValue = nullptr;
-    std::vector<XMLDataPropertyValue*> dataPropertyValueVect;
-    NCF_RETURN(FindPropertyInChildren(property, &dataPropertyValueVect));
-    if (dataPropertyValueVect.empty()) {
-        return kPropertyNotFound;
+    for (XMLDataPropertyValue* child : children_) {
+        if (child->IsNamed(property)) {
+            *dataPropertyValue = child;
+            return NCF_OK;
+        }
     }
-    *dataPropertyValue = dataPropertyValueVect.front();
-    return NCF_OK;
+    return kPropertyNotFound;
 }

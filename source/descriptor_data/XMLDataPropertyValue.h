@@ -40,6 +40,8 @@ public:
     const std::vector<XMLDataPropertyValue*>& Children() const { return children_; }
 
 private:
+    bool IsNamed(const char* property) const;
+
     const XMLDataPropertyDescription* description_;
     NMAString value_;
     XMLDataPropertyValue* parent_ = nullptr;

@@ -24,15 +24,16 @@ ncfUInt32 LastError();
 using FileHandle = ncfSInt64;
 inline constexpr FileHandle kNoFile = -1;
 
-// Opens a regular file for unbuffered reading where the file system allows it,
-// buffered elsewhere. kNoFile for folders, pipes, devices and what is absent.
+// Opens a regular file for reads that bring nothing into the system's cache beyond
+// what they ask for: Windows reads past the cache, POSIX systems through it, with
+// nothing read ahead. kNoFile for folders, pipes, devices and what is absent.
 FileHandle OpenForReading(const std::u16string& path);
 bool Close(FileHandle file);
 // Length in bytes.
 bool GetFileSize(FileHandle file, ncfUInt64* size);
 // Bytes in a sector of the volume, which reads are aligned to in position, size
-// and address. `volumeRoot` is what SimpleFileIO took from the path, empty when
-// there is none; only Windows asks by it. false when unknown.
+// and address; on Windows they must be. `volumeRoot` is what SimpleFileIO took from
+// the path, empty when there is none; only Windows asks by it. false when unknown.
 bool GetSectorSize(FileHandle file, const std::u16string& volumeRoot, ncfUInt32* bytes);
 bool SetPosition(FileHandle file, ncfUInt64 position);
 // Reads at the position set; `*bytesRead` below `size` at the end of the file.

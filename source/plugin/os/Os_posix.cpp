@@ -1,8 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// The operating system, by POSIX calls. Unbuffered reads step down to buffered
-// ones without a word where a file system refuses them.
+// The operating system, by POSIX calls.
 
 #include <dlfcn.h>
 #include <fcntl.h>
@@ -70,16 +69,6 @@ std::string SystemPath(const std::u16string& path) {
     return out;
 }
 
-int OpenDescriptor(const std::string& path) {
-    // Non-blocking, so that a pipe without a writer is refused, not awaited.
-    const int flags = O_RDONLY | O_CLOEXEC | O_NONBLOCK;
-    const int direct = open(path.c_str(), flags | O_DIRECT);
-    if (direct >= 0 || errno != EINVAL) {
-        return direct;
-    }
-    return open(path.c_str(), flags);
-}
-
 }  // namespace
 
 ncfUInt32 LastError() {
@@ -87,7 +76,8 @@ ncfUInt32 LastError() {
 }
 
 FileHandle OpenForReading(const std::u16string& path) {
-    const int descriptor = OpenDescriptor(SystemPath(path));
+    // Non-blocking, so that a pipe without a writer is refused, not awaited.
+    const int descriptor = open(SystemPath(path).c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (descriptor < 0) {
         Fail(errno);
         return kNoFile;
@@ -99,6 +89,9 @@ FileHandle OpenForReading(const std::u16string& path) {
         close(descriptor);
         return kNoFile;
     }
+    // A few places of a large file are read, so what lies behind them is not wanted.
+    // Only a hint.
+    posix_fadvise(descriptor, 0, 0, POSIX_FADV_RANDOM);
     return descriptor;
 }
 
@@ -140,22 +133,10 @@ bool SetPosition(FileHandle file, ncfUInt64 position) {
 bool Read(FileHandle file, void* buffer, ncfUInt32 size, ncfUInt32* bytesRead) {
     const int descriptor = static_cast<int>(file);
     ncfUInt32 done = 0;
-    bool buffered = false;
     while (done < size) {
         const ssize_t n = read(descriptor, static_cast<char*>(buffer) + done, size - done);
         if (n < 0 && errno == EINTR) {
             continue;
-        }
-        if (n < 0 && errno == EINVAL && !buffered) {
-            // The file system, or the odd rest behind a short read, does not
-            // go with unbuffered access.
-            const int flags = fcntl(descriptor, F_GETFL);
-            buffered = true;
-            if (flags >= 0 && (flags & O_DIRECT) != 0 &&
-                fcntl(descriptor, F_SETFL, flags & ~O_DIRECT) == 0) {
-                continue;
-            }
-            return Fail(EINVAL);
         }
         if (n < 0) {
             return Fail(errno);

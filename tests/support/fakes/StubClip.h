@@ -35,7 +35,7 @@ public:
     NCFRESULT GetMovieLength(ncfUInt64*) const override { return NCF_E_NOTIMPL; }
     NCFRESULT GetCreationTime(ncfUInt64*) override { return NCF_E_NOTIMPL; }
     NCFRESULT GetCodecName(ncfUInt32, NCFSmartPtr<INCFString>&) override { return NCF_E_NOTIMPL; }
-    NCFRESULT GetContentForHash(std::vector<ncfUInt8>&) override { return NCF_E_NOTIMPL; }
+    NCFRESULT GetContentForHash(ByteVector&) override { return NCF_E_NOTIMPL; }
     NCFRESULT IsSelfContained() override { return NCF_E_NOTIMPL; }
     NCFRESULT IsVideoSampleProviderMedia(AAFInfo*) override { return NCF_E_NOTIMPL; }
     NCFRESULT HasOneFrame(ncfBool*) override { return NCF_E_NOTIMPL; }

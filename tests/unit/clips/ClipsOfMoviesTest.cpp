@@ -71,9 +71,9 @@ protected:
         return length;
     }
     std::vector<ncfUInt8> Content() {
-        std::vector<ncfUInt8> content;
+        ByteVector content;
         EXPECT_EQ(clip->GetContentForHash(content), NCF_OK);
-        return content;
+        return {content.begin(), content.end()};
     }
 
     const std::int64_t objectsBefore = host::LiveObjectCount();
@@ -244,7 +244,7 @@ TEST_F(ClipsOfMovies, AnswerWithFailuresWhenTheyFailed) {
     ASSERT_TRUE(clip);
     ncfUInt32 number = 0;
     ncfUInt64 wide = 0;
-    std::vector<ncfUInt8> content;
+    ByteVector content;
     AudioTrackMetadata info;
     EXPECT_LT(clip->GetVideoTrackCount(&number), 0);
     EXPECT_LT(clip->GetTrackCount(&number), 0);
@@ -289,7 +289,7 @@ TEST_F(ClipsOfMovies, SurviveTurnedBitsInTheirHeader) {
         const NCFRESULT result = Load(broken);
         EXPECT_TRUE(result == NMA_E_NOTINITIALIZED || result == NCF_OK) << at;
         if (result == NCF_OK) {
-            std::vector<ncfUInt8> content;
+            ByteVector content;
             clip->GetContentForHash(content);
             clip->SetEditRate(EditorSettings());
             clip->SetMovieLength(EditorSettings());

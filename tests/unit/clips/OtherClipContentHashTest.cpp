@@ -10,20 +10,20 @@ constexpr std::size_t kMebibyte = 1048576;
 class OtherClipContentHash : public OtherClipTest {
 protected:
     // The content of a clip over a file with these bytes.
-    std::vector<ncfUInt8> ContentOf(const std::vector<ncfUInt8>& bytes) {
+    ByteVector ContentOf(const std::vector<ncfUInt8>& bytes) {
         const TempFile own(bytes, "hashed.avi");
         NCFSmartPtr<INCFConsole> console(&host->console());
         NCFSmartPtr<INCFComponentFactory> factory(host->factory());
         OtherClip hashed(HostText(own.path()), console, factory);
-        std::vector<ncfUInt8> content(3, 99);  // cleared first
+        ByteVector content(3, 99);  // cleared first
         EXPECT_EQ(hashed.GetContentForHash(content), NCF_OK);
         return content;
     }
-    static std::vector<ncfUInt8> Length(ncfUInt8 byte5, ncfUInt8 byte6, ncfUInt8 byte7) {
+    static ByteVector Length(ncfUInt8 byte5, ncfUInt8 byte6, ncfUInt8 byte7) {
         return {0, 0, 0, 0, 0, byte5, byte6, byte7};
     }
-    static std::vector<ncfUInt8> Join(std::initializer_list<std::vector<ncfUInt8>> parts) {
-        std::vector<ncfUInt8> all;
+    static ByteVector Join(std::initializer_list<ByteVector> parts) {
+        ByteVector all;
         for (const auto& part : parts) {
             all.insert(all.end(), part.begin(), part.end());
         }
@@ -80,7 +80,7 @@ TEST_F(OtherClipContentHash, CountsATrackWithoutACodeAsFourZeros) {
 TEST_F(OtherClipContentHash, CountsTracksInOneByte) {
     wrapper->AddSound(1);
     wrapper->describedTracks = 257;
-    const std::vector<ncfUInt8> content = ContentOf({42});
+    const ByteVector content = ContentOf({42});
     EXPECT_EQ(content.size(), 1 + 257 * 4 + 8u);
     EXPECT_EQ(content.front(), 1);
     EXPECT_EQ(wrapper->lastTrack, 257u);
@@ -90,7 +90,7 @@ TEST_F(OtherClipContentHash, TakesNoMoreCodesThanAMovieCanHaveTracks) {
     wrapper->AddSound(1);
     for (const ncfUInt32 told : {65536u, 0xFFFFFFFFu}) {
         wrapper->describedTracks = told;
-        const std::vector<ncfUInt8> content = ContentOf({42});
+        const ByteVector content = ContentOf({42});
         ASSERT_EQ(content.size(), 1 + 65535 * 4 + 8u) << told;
         EXPECT_EQ(content.front(), static_cast<ncfUInt8>(told)) << "the number as it is told";
         EXPECT_EQ(wrapper->lastTrack, 65535u);
@@ -100,7 +100,7 @@ TEST_F(OtherClipContentHash, TakesNoMoreCodesThanAMovieCanHaveTracks) {
 TEST_F(OtherClipContentHash, OpensTheMovieOnce) {
     wrapper->AddSound(1);
     LoadOther();
-    std::vector<ncfUInt8> content;
+    ByteVector content;
     EXPECT_EQ(other->GetContentForHash(content), NCF_OK);
     EXPECT_EQ(journal.count("wrapper.NewMovieFromFilePath"), 1);
 }
@@ -110,6 +110,6 @@ TEST_F(OtherClipContentHash, ThrowsWhenTheFileIsGone) {
     wrapper->AddSound(1);
     LoadOther();
     std::remove(file.path().c_str());
-    std::vector<ncfUInt8> content;
+    ByteVector content;
     EXPECT_THROW(other->GetContentForHash(content), NCFRESULT);
 }

@@ -277,6 +277,6 @@ TEST_F(OtherClipMovie, AnswersWithoutAWrapper) {
     EXPECT_EQ(other->GetNumSamples(1, &large), NCF_E_POINTER);
     EXPECT_EQ(LastRecord(), "CHK_PTR(sampleTable_)OtherClip::GetNumSamples");
     EXPECT_EQ(other->CalculateAudioTrackLengthInSamples(1, &large), NCF_E_POINTER);
-    std::vector<ncfUInt8> content;
+    ByteVector content;
     EXPECT_EQ(other->GetContentForHash(content), NCF_E_OUTOFMEMORY);
 }

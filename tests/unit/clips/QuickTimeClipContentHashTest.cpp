@@ -7,7 +7,7 @@
 
 namespace {
 
-using Bytes = std::vector<ncfUInt8>;
+using Bytes = ByteVector;
 
 class QuickTimeClipContentHash : public ClipTest {
 protected:
@@ -37,7 +37,7 @@ protected:
         return clip->GetContentForHash(content);
     }
 
-    Bytes whole;
+    std::vector<ncfUInt8> whole;
     Bytes content;
 };
 
@@ -248,7 +248,7 @@ TEST_F(QuickTimeClipContentHash, GivesCopiesOfAMovieOneIdentity) {
     Load();
     ASSERT_EQ(Ask(), NCF_OK);
     const Bytes first = content;
-    Bytes changed = whole;
+    std::vector<ncfUInt8> changed = whole;
     changed[8000] ^= 0xFF;  // outside header and chunk
     const TempFile copy(changed, "copy.mov");
     NCFSmartPtr<INCFConsole> console(&host->console());

@@ -106,6 +106,24 @@ TEST(SampleTable, CountsPartialSyncSamplesAsSync) {
     EXPECT_EQ(Flags(TableOf(movie)), (std::vector<ncfUInt32>{1, 3, 1, 3}));
 }
 
+// Among many entries or few, wherever the empty one stands.
+TEST(SampleTable, PassesOverOffsetsOfNoSamples) {
+    for (const unsigned entries : {3u, 16u, 40u}) {
+        for (const unsigned empty : {0u, 1u, entries - 1}) {
+            Movie movie = WithSamples({{entries, 100, 10}});
+            movies::Box offsets = movies::Box("ctts").Version(0).U32(entries + 1);
+            for (unsigned i = 0; i <= entries; ++i) {
+                const bool isEmpty = i == empty;
+                offsets.U32(isEmpty ? 0 : 1).U32(isEmpty ? static_cast<std::uint32_t>(-999) : 20);
+            }
+            movie.tracks[0].added = {offsets};
+            const Table table = TableOf(movie);
+            EXPECT_EQ(DisplayOffsets(table), Offsets(entries, 0)) << entries << ", " << empty;
+            EXPECT_EQ(Ask(table, &IQTSampleTable::GetHasOutOfOrderFrameDependencies), 0);
+        }
+    }
+}
+
 TEST(SampleTable, HasNoDisplayOffsetsWithoutATable) {
     const Table table = TableOf(WithSamples({{3, 100, 1}}));
     EXPECT_EQ(DisplayOffsets(table), (Offsets{0, 0, 0}));

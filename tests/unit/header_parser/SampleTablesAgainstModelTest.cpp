@@ -119,12 +119,13 @@ movies::Track RandomTrack(Random& random) {
     const bool hasDependencies = Below(random, 2) != 0;
     const bool hasOneSize = Below(random, 4) == 0;
     const bool hasTwoDescriptions = Below(random, 3) == 0;
+    const bool hasOneDuration = Below(random, 2) == 0;
     const unsigned longest = 1 + Below(random, 40);
     for (unsigned i = 0; i < runs; ++i) {
         movies::SampleRun run;
         run.count = 1 + Below(random, longest);
         run.size = hasOneSize ? 123 : Below(random, 5) == 0 ? 0 : Below(random, 100000);
-        run.duration = Below(random, 6) == 0 ? 0 : 1 + Below(random, 1000);
+        run.duration = hasOneDuration ? 500 : Below(random, 6) == 0 ? 0 : 1 + Below(random, 1000);
         run.displayOffset = hasOffsets ? static_cast<int>(Below(random, 4000)) - 1000 : 0;
         run.sync = !hasDependencies || Below(random, 5) == 0;
         run.disposable = hasDependencies && Below(random, 2) == 0;

@@ -59,7 +59,7 @@ public:
     NCFRESULT layoutResult = NCF_OK;
     std::string codecName = "H.264";
     INCFString* codecString = nullptr;  // given in place of the name when set
-    std::vector<ncfUInt8> content = {1, 2, 3, 4};
+    ByteVector content = {1, 2, 3, 4};
     // Operation -> failure.
     std::map<std::string, NCFRESULT> failures;
     // Hears each question before it is answered.
@@ -128,7 +128,7 @@ public:
         }
         return result;
     }
-    NCFRESULT GetContentForHash(std::vector<ncfUInt8>& out) override {
+    NCFRESULT GetContentForHash(ByteVector& out) override {
         return answer("GetContentForHash", &out, content);
     }
     NCFRESULT IsVideoSampleProviderMedia(AAFInfo* out) override {

@@ -16,11 +16,11 @@ namespace {
 
 constexpr std::size_t kLong = 20 * kHashChunkSize + 777;
 // What one read may fetch, with the sectors at its two ends.
-constexpr std::size_t kLargestPiece = 4 * kHashChunkSize + 2 * 2048;
+constexpr std::size_t kLargestPiece = kHashChunkSize + 2 * 2048;
 
 // From a place and to a place where no sector begins, the system's reads pass
 // through a buffer of the reader's: a long one would be the content once more.
-TEST(LongHashContentReads, HoldAFewMebibytesBesideTheContent) {
+TEST(LongHashContentReads, HoldAMebibyteBesideTheContent) {
     FakeOs& system = FakeOs::Get() = FakeOs();
     system.content.resize(kLong + 4096);
     for (std::size_t i = 0; i < system.content.size(); i += 1000) {
@@ -29,7 +29,7 @@ TEST(LongHashContentReads, HoldAFewMebibytesBesideTheContent) {
     INCFString* const path = MakeHostString("C:\\movies\\clip.mov");
     {
         NMA::Impl::SimpleFileIO reader(path);
-        std::vector<ncfUInt8> content;
+        ByteVector content;
         ASSERT_EQ(AppendFileRange("Reader", "read it", reader, 1001, kLong, content), NCF_OK);
         ASSERT_EQ(content.size(), kLong);
         EXPECT_TRUE(std::equal(content.begin(), content.end(), system.content.begin() + 1001));

@@ -7,11 +7,13 @@
 #include <dlfcn.h>
 #include <fcntl.h>
 #include <gtest/gtest.h>
+#include <sys/mman.h>
 #include <sys/stat.h>
 #include <sys/statfs.h>
 #include <sys/statvfs.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
@@ -20,6 +22,7 @@
 #include <limits>
 #include <string>
 #include <thread>
+#include <vector>
 
 namespace {
 
@@ -82,15 +85,14 @@ TEST_F(OperatingSystem, ReadsAFileWhosePathHasBackslashes) {
     EXPECT_TRUE(os::Close(file));
 }
 
-TEST_F(OperatingSystem, StepsDownToBufferedReadsWhereUnbufferedOnesAreRefused) {
+TEST_F(OperatingSystem, ReadsFromAnyPlaceToAnyPlace) {
     std::string bytes(5000, '\0');
     for (std::size_t i = 0; i < bytes.size(); ++i) {
         bytes[i] = static_cast<char>(i % 251);
     }
     const os::FileHandle file = os::OpenForReading(write("a.bin", bytes));
     ASSERT_NE(file, os::kNoFile);
-    // No unbuffered read starts at such a place, has such a size, or lands
-    // there.
+    // Neither place nor size nor address is a multiple of a sector.
     std::string seen(1001, 'x');
     ncfUInt32 bytesRead = 0;
     ASSERT_TRUE(os::SetPosition(file, 7));
@@ -98,8 +100,46 @@ TEST_F(OperatingSystem, StepsDownToBufferedReadsWhereUnbufferedOnesAreRefused) {
     EXPECT_EQ(bytesRead, 1000u);
     EXPECT_EQ(seen.substr(1), bytes.substr(7, 1000));
     ASSERT_TRUE(os::SetPosition(file, 4990));
-    ASSERT_TRUE(os::Read(file, &seen[1], 1000, &bytesRead)) << "and it stays so";
+    ASSERT_TRUE(os::Read(file, &seen[1], 1000, &bytesRead));
     EXPECT_EQ(bytesRead, 10u);
+    EXPECT_TRUE(os::Close(file));
+}
+
+// How many bytes of a file the system's cache holds, in whole pages.
+std::size_t CachedBytes(const std::filesystem::path& path) {
+    const std::size_t size = std::filesystem::file_size(path);
+    const auto page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
+    const int descriptor = open(path.c_str(), O_RDONLY);
+    void* const view = mmap(nullptr, size, PROT_READ, MAP_SHARED, descriptor, 0);
+    std::vector<unsigned char> states((size + page - 1) / page);
+    EXPECT_EQ(mincore(view, size, states.data()), 0);
+    munmap(view, size);
+    close(descriptor);
+    const auto cached = std::count_if(states.begin(), states.end(),
+                                      [](unsigned char state) { return (state & 1) != 0; });
+    return static_cast<std::size_t>(cached) * page;
+}
+
+// A movie may be as long as the machine's memory.
+TEST_F(OperatingSystem, BringsIntoTheCacheOnlyWhatIsRead) {
+    constexpr ncfUInt32 kPiece = 64 << 10;
+    const std::u16string name = write("a.bin", std::string(16 * kPiece, 'x'));
+    const std::filesystem::path path = folder / "a.bin";
+    const int descriptor = open(path.c_str(), O_RDWR);
+    fdatasync(descriptor);
+    posix_fadvise(descriptor, 0, 0, POSIX_FADV_DONTNEED);
+    close(descriptor);
+    if (CachedBytes(path) != 0) {
+        GTEST_SKIP() << "this file system keeps its files in memory";
+    }
+    const os::FileHandle file = os::OpenForReading(name);
+    std::string seen(kPiece, ' ');
+    ncfUInt32 bytesRead = 0;
+    for (const ncfUInt64 position : {ncfUInt64{0}, ncfUInt64{8} * kPiece}) {
+        ASSERT_TRUE(os::SetPosition(file, position));
+        ASSERT_TRUE(os::Read(file, seen.data(), kPiece, &bytesRead));
+    }
+    EXPECT_EQ(CachedBytes(path), 2 * kPiece);
     EXPECT_TRUE(os::Close(file));
 }
 
