@@ -280,7 +280,8 @@ TEST_F(Delivery, MemoryOfAConvertedFrameIsKeptForTheNextOne) {
     const void* const first = wrapper->picture->destination;
     EXPECT_EQ(first, mapping->scratch_.data());
     Frame() = {1, 2, 3, 9};
-    EXPECT_EQ(Ask(1), NCF_OK) << "a smaller one";
+    EXPECT_EQ(Ask(1), NCF_OK);
+    EXPECT_EQ(wrapper->picture->destination, first) << "for a smaller one too";
     Frame() = {1, 2, 3, 4, 5, 6, 7, 8};
     EXPECT_EQ(Ask(1), NCF_OK);
     EXPECT_EQ(wrapper->picture->destination, first);
