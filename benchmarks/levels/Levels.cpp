@@ -16,6 +16,7 @@
 #include "source/essence/FloatConversion.h"
 #include "source/essence/FormatEnums.h"
 #include "source/essence/LevelTables.h"
+#include "source/essence/MediaFormat.h"
 #include "source/essence/PixelLevels.h"
 
 namespace {
@@ -82,20 +83,25 @@ void Levels(benchmark::State& state, ncfUInt32 pixelFormat, ncfUInt32 componentT
     Count(state, picture.size());
 }
 
-using Conversion = void (*)(const ncfUInt8*, ncfUInt8*, std::size_t, std::size_t, ncfUInt32,
-                            ncfUInt32);
-
-void Convert(benchmark::State& state, Conversion convert, const Bytes& source,
-             std::size_t bytesOut) {
+// A pixel format without levels, such as 'PF_Mono', leaves the conversion alone.
+void Convert(benchmark::State& state, PixelConversion convertFrame, const Bytes& source,
+             std::size_t bytesOut, ncfUInt32 pixelFormat = PF_Mono,
+             ncfUInt32 mode = Default_Levels) {
     Bytes destination(kPixels * bytesOut);
-    convert(source.data(), destination.data(), source.size(), destination.size(), kWidth, kHeight);
+    const auto convert = [&] {
+        LevelPass levels(pixelFormat, CT_USHORT_BE_VideoRange, destination.data(),
+                         destination.size(), mode);
+        convertFrame(source.data(), destination.data(), source.size(), destination.size(), kWidth,
+                     kHeight, levels);
+        levels.Finish();
+    };
+    convert();
     if (destination == Bytes(destination.size())) {
         state.SkipWithError("nothing was converted");
         return;
     }
     for (auto _ : state) {
-        convert(source.data(), destination.data(), source.size(), destination.size(), kWidth,
-                kHeight);
+        convert();
         benchmark::ClobberMemory();
     }
     Count(state, source.size());
@@ -140,6 +146,12 @@ void AlphaOfR4fl(benchmark::State& state) {
 void R4flToB64a(benchmark::State& state) {
     Convert(state, &ConvertR4flToB64a, FloatPicture(), 8);
 }
+void R4flToOpaqueB64a(benchmark::State& state) {
+    Convert(state, &ConvertR4flToB64a, FloatPicture(), 8, PF_ARGB);
+}
+void R4flToExpandedB64a(benchmark::State& state) {
+    Convert(state, &ConvertR4flToB64a, FloatPicture(), 8, PF_ARGB, Expand_Levels);
+}
 
 BENCHMARK(CopyBGRA);
 BENCHMARK(OpaqueBGRA);
@@ -154,6 +166,8 @@ BENCHMARK(AlphaOfB64a);
 BENCHMARK(CopyR4fl);
 BENCHMARK(AlphaOfR4fl);
 BENCHMARK(R4flToB64a);
+BENCHMARK(R4flToOpaqueB64a);
+BENCHMARK(R4flToExpandedB64a);
 
 }  // namespace
 

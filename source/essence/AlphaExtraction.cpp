@@ -55,7 +55,7 @@ __m128 FourAlphas(const ncfUInt8* from) {
 }  // namespace
 
 void ExtractAlpha8(const ncfUInt8* source, ncfUInt8* destination, std::size_t sourceSize,
-                   std::size_t destinationSize, ncfUInt32, ncfUInt32) {
+                   std::size_t destinationSize, ncfUInt32, ncfUInt32, LevelPass&) {
     const std::size_t count = std::min(sourceSize / 4, destinationSize);
     std::size_t i = 0;
     for (; i + 16 <= count; i += 16) {
@@ -73,7 +73,8 @@ void ExtractAlpha8(const ncfUInt8* source, ncfUInt8* destination, std::size_t so
 // The first byte of a pixel holds the upper eight of its ten bits, the second
 // begins with the lower two.
 void ExtractAlpha10FromB64a(const ncfUInt8* source, ncfUInt8* destination, std::size_t sourceSize,
-                            std::size_t destinationSize, ncfUInt32 width, ncfUInt32 height) {
+                            std::size_t destinationSize, ncfUInt32 width, ncfUInt32 height,
+                            LevelPass&) {
     const std::size_t count = PlanarCount(sourceSize / 8, destinationSize, width, height);
     ncfUInt8* const plane2 = destination + std::size_t{width} * height;
     std::size_t i = 0;
@@ -98,7 +99,8 @@ void ExtractAlpha10FromB64a(const ncfUInt8* source, ncfUInt8* destination, std::
 // A conversion that is out of range gives the least number, of which both
 // planes hold zeros: the same as 0.
 void ExtractAlpha10FromR4fl(const ncfUInt8* source, ncfUInt8* destination, std::size_t sourceSize,
-                            std::size_t destinationSize, ncfUInt32 width, ncfUInt32 height) {
+                            std::size_t destinationSize, ncfUInt32 width, ncfUInt32 height,
+                            LevelPass&) {
     const std::size_t count = PlanarCount(sourceSize / 16, destinationSize, width, height);
     ncfUInt8* const plane2 = destination + std::size_t{width} * height;
     std::size_t i = 0;

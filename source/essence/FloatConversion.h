@@ -6,12 +6,16 @@
 
 #include "host_interfaces/framework/Types.h"
 
+class LevelPass;
+
 // Turns a frame of floats in the order A, Y', Cb, Cr into 16-bit big-endian
 // words in the order A, R, G, B. Colour comes out in video range, alpha in full
-// range. The matrix goes by the size of the picture. Sizes in bytes; rows that
-// one side lacks are left out.
+// range. The matrix goes by the size of the picture. Each part of a row has its
+// levels set while it is in the processor's cache. Sizes in bytes; rows that one
+// side lacks are left out.
 void ConvertR4flToB64a(const ncfUInt8* source, ncfUInt8* destination, std::size_t sourceSize,
-                       std::size_t destinationSize, ncfUInt32 width, ncfUInt32 height);
+                       std::size_t destinationSize, ncfUInt32 width, ncfUInt32 height,
+                       LevelPass& levels);
 
 // Weights of the three colours in luma, in single precision.
 struct LumaWeights {
@@ -33,13 +37,16 @@ inline constexpr float kChromaBias = 128.0f / 255.0f;
 inline constexpr std::size_t kR4flPixelBytes = 16;
 inline constexpr std::size_t kB64aPixelBytes = 8;
 
-// The two kernels, which round and clamp in ways of their own.
+// The kernels for a row, of two kinds that round and clamp in ways of their own.
 //
-// Four pixels a step: to the nearest, ties to even, everything held to 0 to
-// 65535. Does the groups of four that `pixels` holds and gives their count of
-// pixels. Needs a processor with SSE4.1.
-std::size_t ConvertRowVector(const LumaWeights& weights, const ncfUInt8* source,
-                             ncfUInt8* destination, std::size_t pixels);
+// Vector kernels do some pixels a step: to the nearest, ties to even, everything
+// held to 0 to 65535. They do the whole groups that `pixels` holds and give their
+// count of pixels. All give the same words.
+using RowKernel = std::size_t (*)(const LumaWeights& weights, const ncfUInt8* source,
+                                  ncfUInt8* destination, std::size_t pixels);
+// Groups of four. Needs a processor with SSE4.1.
+std::size_t ConvertRowSse41(const LumaWeights& weights, const ncfUInt8* source,
+                            ncfUInt8* destination, std::size_t pixels);
 // One pixel a step: half added and cut off; colour held to 0 to 65535, alpha
 // not, of which the low 16 bits are kept.
 void ConvertRowScalar(const LumaWeights& weights, const ncfUInt8* source, ncfUInt8* destination,

@@ -32,11 +32,15 @@ inline bool operator==(const QTAudioFormat& left, const QTAudioFormat& right) {
            left.bitsPerSample == right.bitsPerSample;
 }
 
+class LevelPass;
+
 // Turns a decoded frame into the layout that was promised. Sizes in bytes;
-// never reads or writes beyond them.
+// never reads or writes beyond them. `levels` goes over the destination: what is
+// sent through it as soon as it is made is still in the processor's cache, the
+// caller sends the rest.
 using PixelConversion = void (*)(const ncfUInt8* source, ncfUInt8* destination,
                                  std::size_t sourceSize, std::size_t destinationSize,
-                                 ncfUInt32 width, ncfUInt32 height);
+                                 ncfUInt32 width, ncfUInt32 height, LevelPass& levels);
 
 // How a picture format is made: what to ask of the reader, what a pixel takes
 // before and after, and what runs between.

@@ -6,13 +6,15 @@
 
 #include "host_interfaces/framework/Types.h"
 
-// The level pass over sixteen bytes at a time, by arithmetic that gives the
-// entries of the level tables exactly. Each does the whole blocks at the start
-// of `pixels` and gives their bytes; what follows is for the tables.
+// The level pass over blocks of many bytes, by arithmetic that gives the entries
+// of the level tables exactly. Each kernel does the whole blocks at the start of
+// `pixels` and gives their bytes, whole pixels if it began with one.
+struct LevelKernels {
+    using Kernel = std::size_t (*)(ncfUInt8* pixels, std::size_t size, ncfUInt32 mode);
+    Kernel bytes;        // B G R A, a byte each
+    Kernel littleWords;  // little-endian words, alpha last
+    Kernel bigWords;     // big-endian words, alpha first
+};
 
-// B G R A, a byte each.
-std::size_t RemapBytesWide(ncfUInt8* pixels, std::size_t size, ncfUInt32 mode);
-// Little-endian words, alpha last.
-std::size_t RemapLittleWordsWide(ncfUInt8* pixels, std::size_t size, ncfUInt32 mode);
-// Big-endian words, alpha first.
-std::size_t RemapBigWordsWide(ncfUInt8* pixels, std::size_t size, ncfUInt32 mode);
+// Blocks of sixteen bytes, for every processor.
+extern const LevelKernels kLevelKernelsSse2;

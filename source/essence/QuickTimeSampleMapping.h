@@ -167,6 +167,7 @@ protected:
 
     NCFRESULT ProvidePicture(MediaTrack& track, ncfUInt64 sample, ncfUInt64 numSamples,
                              const NCFSmartPtr<INCFBuffer>& pBuffer);
+    // A frame in the layout and with the levels of the format.
     NCFRESULT ReadPicture(const QTImageFormat& format, ncfUInt64 sample, ncfUInt32 width,
                           ncfUInt32 height, ncfUInt32 nQuickTimeBufSize, ncfUInt8* pOutputBuffer,
                           ncfUInt32 nOutputBufSize);
@@ -187,6 +188,9 @@ protected:
     NCFSmartPtr<QTWrapper::IQTAudioReader> _audioReaderHolder;   // from the audio query on
     bool imageFormatsReady_ = false;
     NCFSmartPtr<INCFLock> providerLock_;
+    // Where frames are read that don't go straight to the host. Kept, because new
+    // memory costs more than the conversion.
+    std::vector<ncfUInt8> scratch_;
     ncfUInt32 levelRemap_ = Default_Levels;  // the clip's, as of the last look for formats
 };
 

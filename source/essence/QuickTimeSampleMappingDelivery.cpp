@@ -4,7 +4,6 @@
 // From a request of the host to a filled buffer: one picture, or sound.
 
 #include <cstring>
-#include <vector>
 
 #include "source/essence/PixelLevels.h"
 #include "source/essence/ProviderLock.h"
@@ -87,28 +86,30 @@ NCFRESULT QuickTimeSampleMapping::ProvidePicture(MediaTrack& pictureTrack, ncfUI
         rc != NCF_OK) {
         return rc;
     }
+    // A format that isn't defined had no levels: the buffer holds what was read.
     const ncfUInt32 pixelFormat = video_format->pixelFormat;
     const ncfUInt32 componentType = video_format->componentFormat;
     NCFASSERT(PF_UNDEFINED != pixelFormat);
     NCFASSERT(CT_UNDEFINED != componentType);
-    RemapPixelLevels(pixelFormat, componentType, pOutputBuffer, nOutputBufSize, &levelRemap_);
     NCF_RETURN(pBuffer->SetComplete(kNCFBuffer_Complete, nOutputBufSize, NCF_OK));
     return NCF_OK;
 }
 
 // Straight into the host's memory where nothing is to convert. A reader whose
 // frame is larger than the host's buffer must not write past its end: it gets a
-// block of its own, and what fits is copied. The block starts as zeros, so that
-// what a reader left out is nothing, and not what the memory held before.
+// block aside, and what fits is copied. The block starts as zeros each time, so
+// that what a reader left out is nothing, and not what the memory held before.
 NCFRESULT QuickTimeSampleMapping::ReadPicture(const QTImageFormat& format, ncfUInt64 sample,
                                               ncfUInt32 width, ncfUInt32 height,
                                               ncfUInt32 nQuickTimeBufSize, ncfUInt8* pOutputBuffer,
                                               ncfUInt32 nOutputBufSize) {
     const PixelConversion convert = format.qt_params.convert;
     const bool readsAside = convert || nQuickTimeBufSize > nOutputBufSize;
-    std::vector<ncfUInt8> scratch(readsAside ? nQuickTimeBufSize : 0);
-    NCFRESULT rc =
-        _videoReaderHolder->ReadFrame(sample, readsAside ? scratch.data() : pOutputBuffer, 0, 0, 0);
+    if (readsAside) {
+        scratch_.assign(nQuickTimeBufSize, 0);
+    }
+    NCFRESULT rc = _videoReaderHolder->ReadFrame(
+        sample, readsAside ? scratch_.data() : pOutputBuffer, 0, 0, 0);
     if (rc != NCF_OK) {
         if (rc == NCF_E_ACCESSDENIED) {
             rc = kPictureAccessDenied;
@@ -117,11 +118,15 @@ NCFRESULT QuickTimeSampleMapping::ReadPicture(const QTImageFormat& format, ncfUI
                          static_cast<long>(static_cast<ncfSInt32>(static_cast<ncfUInt32>(sample))));
         return rc;
     }
+    LevelPass levels(format.pixelFormat, format.componentFormat, pOutputBuffer, nOutputBufSize,
+                     levelRemap_);
     if (convert) {
-        convert(scratch.data(), pOutputBuffer, nQuickTimeBufSize, nOutputBufSize, width, height);
+        convert(scratch_.data(), pOutputBuffer, nQuickTimeBufSize, nOutputBufSize, width, height,
+                levels);
     } else if (readsAside && nOutputBufSize != 0) {
-        std::memcpy(pOutputBuffer, scratch.data(), nOutputBufSize);
+        std::memcpy(pOutputBuffer, scratch_.data(), nOutputBufSize);
     }
+    levels.Finish();
     return NCF_OK;
 }
 

@@ -8,10 +8,13 @@
 #include <cmath>
 
 #include "tests/unit/essence/support/FloatValues.h"
+#include "tests/unit/essence/support/NoLevels.h"
 
 namespace {
 
 using Bytes = std::vector<ncfUInt8>;
+
+NoLevels levels;
 
 Bytes RandomBytes(std::size_t size) {
     std::mt19937 random(static_cast<unsigned>(size));
@@ -29,7 +32,7 @@ Bytes FromFloats(const std::vector<float>& alphas, ncfUInt32 width) {
     }
     Bytes out(alphas.size() * 2, 0xAA);
     ExtractAlpha10FromR4fl(BytesOf(pixels), out.data(), pixels.size() * sizeof(float), out.size(),
-                           width, static_cast<ncfUInt32>(alphas.size()) / width);
+                           width, static_cast<ncfUInt32>(alphas.size()) / width, levels);
     return out;
 }
 
@@ -39,7 +42,7 @@ TEST(ExtractAlpha8, TakesTheLastByteOfEachPixel) {
     for (std::size_t pixels = 0; pixels < 70; ++pixels) {
         const Bytes source = RandomBytes(pixels * 4);
         Bytes out(pixels);
-        ExtractAlpha8(source.data(), out.data(), source.size(), out.size(), 1, 1);
+        ExtractAlpha8(source.data(), out.data(), source.size(), out.size(), 1, 1, levels);
         for (std::size_t i = 0; i < pixels; ++i) {
             ASSERT_EQ(out[i], source[4 * i + 3]);
         }
@@ -49,11 +52,11 @@ TEST(ExtractAlpha8, TakesTheLastByteOfEachPixel) {
 TEST(ExtractAlpha8, StopsWhereEitherSideEnds) {
     const Bytes source = RandomBytes(40 * 4 + 3);
     Bytes out(50, 0xAA);
-    ExtractAlpha8(source.data(), out.data(), source.size(), out.size(), 50, 1);
+    ExtractAlpha8(source.data(), out.data(), source.size(), out.size(), 50, 1, levels);
     EXPECT_EQ(out[39], source[159]);
     EXPECT_EQ(out[40], 0xAA) << "three bytes are no pixel";
     Bytes few(33, 0xAA);
-    ExtractAlpha8(source.data(), few.data(), source.size(), few.size(), 50, 1);
+    ExtractAlpha8(source.data(), few.data(), source.size(), few.size(), 50, 1, levels);
     EXPECT_EQ(few[32], source[131]);
 }
 
@@ -66,7 +69,7 @@ TEST(ExtractAlpha10FromB64a, SplitsEveryAlphaIntoEightAndTwoBits) {
         source[8 * i + 1] = static_cast<ncfUInt8>(i);
     }
     Bytes out(65536 * 2);
-    ExtractAlpha10FromB64a(source.data(), out.data(), source.size(), out.size(), 256, 256);
+    ExtractAlpha10FromB64a(source.data(), out.data(), source.size(), out.size(), 256, 256, levels);
     int wrong = 0;
     for (std::size_t i = 0; i < 65536; ++i) {
         const std::size_t value = i >> 6;
@@ -82,7 +85,7 @@ TEST(ExtractAlpha10FromB64a, DoesThePixelsBehindTheLastGroup) {
         const Bytes source = RandomBytes(pixels * 8);
         Bytes out(pixels * 2);
         ExtractAlpha10FromB64a(source.data(), out.data(), source.size(), out.size(),
-                               static_cast<ncfUInt32>(pixels), 1);
+                               static_cast<ncfUInt32>(pixels), 1, levels);
         for (std::size_t i = 0; i < pixels; ++i) {
             ASSERT_EQ(out[i], source[8 * i]);
             ASSERT_EQ(out[pixels + i], source[8 * i + 1] >> 6);
@@ -110,7 +113,7 @@ TEST(ExtractAlpha10FromB64a, StaysWithinBothPlanes) {
     for (const Case& test : cases) {
         Bytes out(test.size, 0xAA);
         ExtractAlpha10FromB64a(source.data(), out.data(), source.size(), out.size(), test.width,
-                               test.height);
+                               test.height, levels);
         std::size_t written = 0;
         for (const ncfUInt8 byte : out) {
             written += byte != 0xAA;
@@ -119,7 +122,7 @@ TEST(ExtractAlpha10FromB64a, StaysWithinBothPlanes) {
         Bytes floats(test.size, 0xAA);
         const std::vector<float> pixels(64 * 4, 1.0f);
         ExtractAlpha10FromR4fl(BytesOf(pixels), floats.data(), pixels.size() * 4, floats.size(),
-                               test.width, test.height);
+                               test.width, test.height, levels);
         EXPECT_EQ(floats, out) << "both kinds alike";
     }
 }
@@ -127,7 +130,7 @@ TEST(ExtractAlpha10FromB64a, StaysWithinBothPlanes) {
 TEST(ExtractAlpha10FromB64a, StopsWhereTheSourceEnds) {
     const Bytes source(3 * 8 + 7, 0xFF);
     Bytes out(20, 0xAA);
-    ExtractAlpha10FromB64a(source.data(), out.data(), source.size(), out.size(), 10, 1);
+    ExtractAlpha10FromB64a(source.data(), out.data(), source.size(), out.size(), 10, 1, levels);
     EXPECT_EQ(out[2], 255);
     EXPECT_EQ(out[3], 0xAA);
     EXPECT_EQ(out[12], 3);
@@ -161,7 +164,7 @@ TEST(ExtractAlpha10FromR4fl, AgreesWithAPlainModelInGroupsAndBehindThem) {
         const std::vector<float> pixels = RandomPixels(count, static_cast<unsigned>(count));
         Bytes out(count * 2);
         ExtractAlpha10FromR4fl(BytesOf(pixels), out.data(), pixels.size() * 4, out.size(),
-                               static_cast<ncfUInt32>(count), 1);
+                               static_cast<ncfUInt32>(count), 1, levels);
         int wrong = 0;
         for (std::size_t i = 0; i < count; ++i) {
             const float scaled = pixels[4 * i] * 1023.0f + 0.5f;

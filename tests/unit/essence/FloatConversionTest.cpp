@@ -10,12 +10,16 @@
 #include <array>
 #include <cmath>
 
+#include "source/essence/Avx2Kernels.h"
 #include "tests/unit/essence/support/FloatValues.h"
+#include "tests/unit/essence/support/NoLevels.h"
 
 namespace {
 
 using Bytes = std::vector<ncfUInt8>;
 using Words = std::array<ncfUInt16, 4>;  // A R G B
+
+NoLevels levels;
 
 struct Weights {
     float Kr;
@@ -82,7 +86,8 @@ Words PixelOf(const Bytes& frame, std::size_t pixel) {
 
 Bytes Converted(const std::vector<float>& pixels, ncfUInt32 width, ncfUInt32 height) {
     Bytes out(std::size_t{width} * height * 8, 0xAA);
-    ConvertR4flToB64a(BytesOf(pixels), out.data(), pixels.size() * 4, out.size(), width, height);
+    ConvertR4flToB64a(BytesOf(pixels), out.data(), pixels.size() * 4, out.size(), width, height,
+                      levels);
     return out;
 }
 
@@ -203,7 +208,7 @@ TEST(FloatConversion, PathsDifferInFewWordsAndByOne) {
     }
     Bytes vector(count * 8);
     Bytes scalar(count * 8);
-    EXPECT_EQ(ConvertRowVector(kRec709, BytesOf(pixels), vector.data(), count), count);
+    EXPECT_EQ(ConvertRowSse41(kRec709, BytesOf(pixels), vector.data(), count), count);
     ConvertRowScalar(kRec709, BytesOf(pixels), scalar.data(), count);
     int different = 0;
     for (std::size_t i = 0; i < count; ++i) {
@@ -218,17 +223,137 @@ TEST(FloatConversion, PathsDifferInFewWordsAndByOne) {
     EXPECT_LT(different, 5000) << "of a million";
 }
 
-TEST(FloatConversion, AlignmentChangesNoWord) {
+// --- each vector kernel by itself ---------------------------------------------------------
+
+struct VectorKernel {
+    const char* name;
+    RowKernel convert;
+    std::size_t group;  // pixels
+};
+
+void PrintTo(const VectorKernel& kernel, std::ostream* out) {
+    *out << kernel.name;
+}
+
+std::vector<VectorKernel> VectorKernels() {
+    std::vector<VectorKernel> kernels = {{"SSE4.1", &ConvertRowSse41, 4}};
+    if (const Avx2Kernels* const wide = FindAvx2Kernels()) {
+        kernels.push_back({"AVX2", wide->convertRow, 8});
+    }
+    return kernels;
+}
+
+class VectorKernelTest : public testing::TestWithParam<VectorKernel> {
+protected:
+    static Bytes Row(const std::vector<float>& pixels) {
+        Bytes out(pixels.size() * 2, 0xAA);
+        const std::size_t count = pixels.size() / 4;
+        EXPECT_EQ(GetParam().convert(kRec709, BytesOf(pixels), out.data(), count),
+                  count / GetParam().group * GetParam().group);
+        return out;
+    }
+};
+INSTANTIATE_TEST_SUITE_P(FloatConversion, VectorKernelTest, testing::ValuesIn(VectorKernels()));
+
+TEST_P(VectorKernelTest, AgreesWithTheModelOverRandomAndEdgePixels) {
+    const std::vector<float> pixels = RandomPixels(100000, 8);
+    const Bytes row = Row(pixels);
+    int wrong = 0;
+    for (std::size_t i = 0; i < 100000; ++i) {
+        wrong += PixelOf(row, i) != VectorModel(kModel709, &pixels[4 * i]);
+    }
+    EXPECT_EQ(wrong, 0);
+}
+
+// Floats of every exponent and both signs, of no number and of numbers too small
+// to be normal, in the place of each component.
+TEST_P(VectorKernelTest, AgreesWithTheModelOverFloatsOfAllKinds) {
+    for (std::size_t component = 0; component < 4; ++component) {
+        std::vector<float> pixels;
+        for (std::uint64_t bits = 0; bits < (std::uint64_t{1} << 32); bits += 32749) {
+            float value = 0.0f;
+            const auto low = static_cast<std::uint32_t>(bits);
+            std::memcpy(&value, &low, sizeof value);
+            const std::size_t at = pixels.size() + component;
+            pixels.insert(pixels.end(), {0.25f, 0.5f, 0.75f, 0.375f});
+            pixels[at] = value;
+        }
+        pixels.resize(pixels.size() / 32 * 32);
+        const Bytes row = Row(pixels);
+        int wrong = 0;
+        for (std::size_t i = 0; i < pixels.size() / 4; ++i) {
+            wrong += PixelOf(row, i) != VectorModel(kModel709, &pixels[4 * i]);
+        }
+        EXPECT_EQ(wrong, 0) << component;
+    }
+}
+
+TEST_P(VectorKernelTest, WhatIsNoNumberIs0AndWhatIsTooLargeIs65535InEveryWord) {
+    const float infinity = std::numeric_limits<float>::infinity();
+    const auto word = [](float value) {
+        const std::vector<float> pixels(8 * 4, value);
+        const Bytes row = Row(pixels);
+        const Words first = PixelOf(row, 0);
+        for (std::size_t i = 1; i < 8; ++i) {
+            EXPECT_EQ(PixelOf(row, i), first);
+        }
+        return first[0];
+    };
+    EXPECT_EQ(word(std::nanf("")), 0);
+    EXPECT_EQ(word(-std::nanf("")), 0);
+    EXPECT_EQ(word(std::numeric_limits<float>::signaling_NaN()), 0);
+    EXPECT_EQ(word(3e9f), 65535);
+    EXPECT_EQ(word(infinity), 65535);
+    EXPECT_EQ(word(-3e9f), 0);
+    EXPECT_EQ(word(-infinity), 0);
+    EXPECT_EQ(word(-0.0f), 0);
+    EXPECT_EQ(word(std::numeric_limits<float>::denorm_min()), 0);
+}
+
+TEST_P(VectorKernelTest, AlignmentChangesNoWord) {
     const std::vector<float> pixels = RandomPixels(64, 3);
-    alignas(16) ncfUInt8 source[64 * 16 + 16];
-    alignas(16) ncfUInt8 destination[64 * 8 + 16];
-    Bytes expected(64 * 8);
-    ConvertRowVector(kRec601, BytesOf(pixels), expected.data(), 64);
-    for (std::size_t from = 0; from < 16; ++from) {
-        for (std::size_t to = 0; to < 16; ++to) {
+    alignas(32) ncfUInt8 source[64 * 16 + 32];
+    alignas(32) ncfUInt8 destination[64 * 8 + 32];
+    const Bytes expected = Row(pixels);
+    for (std::size_t from = 0; from < 32; ++from) {
+        for (std::size_t to = 0; to < 32; ++to) {
             std::memcpy(source + from, pixels.data(), 64 * 16);
-            ASSERT_EQ(ConvertRowVector(kRec601, source + from, destination + to, 64), 64u);
+            ASSERT_EQ(GetParam().convert(kRec709, source + from, destination + to, 64), 64u);
             ASSERT_EQ(Bytes(destination + to, destination + to + 64 * 8), expected);
+        }
+    }
+}
+
+TEST_P(VectorKernelTest, DoesWholeGroupsOnly) {
+    const std::vector<float> pixels(31 * 4, 0.5f);
+    for (std::size_t count = 0; count <= 31; ++count) {
+        const std::size_t done = count / GetParam().group * GetParam().group;
+        Bytes out(31 * 8, 0xAA);
+        EXPECT_EQ(GetParam().convert(kRec601, BytesOf(pixels), out.data(), count), done);
+        EXPECT_EQ(Bytes(out.begin() + static_cast<std::ptrdiff_t>(done * 8), out.end()),
+                  Bytes((31 - done) * 8, 0xAA));
+    }
+}
+
+// --- the frame ----------------------------------------------------------------------------
+
+// In parts of a row, the last of which may be a single pixel, and with rows
+// that the source lacks.
+TEST(FloatConversion, LevelsSetOnTheWayAreThoseSetBehindIt) {
+    for (const ncfUInt32 width : {1u, 3u, 255u, 256u, 257u, 600u}) {
+        for (const ncfUInt32 mode : {Default_Levels, Expand_Levels, Compress_Levels}) {
+            const std::vector<float> pixels = RandomPixels(std::size_t{width} * 3, width);
+            const std::size_t size = std::size_t{width} * 8 * 5;
+            Bytes behind(size, 0x55);
+            ConvertR4flToB64a(BytesOf(pixels), behind.data(), pixels.size() * 4, size, width, 5,
+                              levels);
+            RemapPixelLevels(PF_ARGB, CT_USHORT_BE_VideoRange, behind.data(), size, &mode);
+            Bytes onTheWay(size, 0x55);
+            LevelPass pass(PF_ARGB, CT_USHORT_BE_VideoRange, onTheWay.data(), size, mode);
+            ConvertR4flToB64a(BytesOf(pixels), onTheWay.data(), pixels.size() * 4, size, width, 5,
+                              pass);
+            pass.Finish();
+            EXPECT_TRUE(onTheWay == behind) << width << " " << mode;
         }
     }
 }
@@ -249,7 +374,7 @@ TEST(FloatConversion, RowsThatOneSideLacksAreLeftOut) {
                           {4 * rowIn, 4 * rowOut, 0, 0}};
     for (const Case& test : cases) {
         Bytes out(test.out, 0xAA);
-        ConvertR4flToB64a(BytesOf(pixels), out.data(), test.in, test.out, 5, test.height);
+        ConvertR4flToB64a(BytesOf(pixels), out.data(), test.in, test.out, 5, test.height, levels);
         Bytes expected(test.out, 0xAA);
         const Bytes whole = Converted(pixels, 5, 4);
         std::copy(whole.begin(), whole.begin() + static_cast<std::ptrdiff_t>(test.rows * rowOut),
@@ -261,18 +386,10 @@ TEST(FloatConversion, RowsThatOneSideLacksAreLeftOut) {
 TEST(FloatConversion, PictureWithoutWidthOrBeyondAllMemoryIsNothing) {
     const std::vector<float> pixels(16, 0.5f);
     Bytes out(32, 0xAA);
-    ConvertR4flToB64a(BytesOf(pixels), out.data(), 64, 32, 0, 4);
-    ConvertR4flToB64a(BytesOf(pixels), out.data(), 64, 32, 0xFFFFFFFF, 0xFFFFFFFF);
-    ConvertR4flToB64a(BytesOf(pixels), out.data(), 64, 32, 0x10000000, 1);
+    ConvertR4flToB64a(BytesOf(pixels), out.data(), 64, 32, 0, 4, levels);
+    ConvertR4flToB64a(BytesOf(pixels), out.data(), 64, 32, 0xFFFFFFFF, 0xFFFFFFFF, levels);
+    ConvertR4flToB64a(BytesOf(pixels), out.data(), 64, 32, 0x10000000, 1, levels);
     EXPECT_EQ(out, Bytes(32, 0xAA));
-}
-
-TEST(FloatConversion, VectorKernelDoesWholeGroupsOnly) {
-    const std::vector<float> pixels(7 * 4, 0.5f);
-    Bytes out(7 * 8, 0xAA);
-    EXPECT_EQ(ConvertRowVector(kRec601, BytesOf(pixels), out.data(), 7), 4u);
-    EXPECT_EQ(out[4 * 8], 0xAA);
-    EXPECT_EQ(ConvertRowVector(kRec601, BytesOf(pixels), out.data(), 3), 0u);
 }
 
 }  // namespace

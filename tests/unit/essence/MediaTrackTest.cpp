@@ -24,7 +24,8 @@ QTImageFormat SomeFormat() {
     return format;
 }
 
-void NoConversion(const ncfUInt8*, ncfUInt8*, std::size_t, std::size_t, ncfUInt32, ncfUInt32) {}
+void NoConversion(const ncfUInt8*, ncfUInt8*, std::size_t, std::size_t, ncfUInt32, ncfUInt32,
+                  LevelPass&) {}
 
 // A track that can hold an entry without a format.
 class TrackWithAHole final : public MediaTrack {

@@ -8,6 +8,7 @@
 #include <random>
 #include <vector>
 
+#include "source/essence/Avx2Kernels.h"
 #include "source/essence/FormatEnums.h"
 #include "source/essence/LevelTables.h"
 
@@ -193,6 +194,123 @@ TEST(PixelLevels, RandomPixelsAtEveryAlignment) {
         RemapPixelLevels(PF_BGRA, CT_UCHAR, done.data() + at, 4096, &mode);
         for (std::size_t i = 0; i < 4096; ++i) {
             ASSERT_EQ(done[at + i], i % 4 == 3 ? 255 : Mapped8(block[at + i], mode));
+        }
+    }
+}
+
+TEST(LevelPass, InPartsItIsTheSameAsAtOnce) {
+    std::mt19937 random(9);
+    Bytes pixels(4096);
+    for (ncfUInt8& byte : pixels) {
+        byte = static_cast<ncfUInt8>(random());
+    }
+    const std::pair<ncfUInt32, ncfUInt32> layouts[] = {
+        {PF_BGRA, CT_UCHAR}, {PF_BGRA, CT_USHORT_10_6}, {PF_ARGB, CT_USHORT_BE_FullRange}};
+    for (const auto& layout : layouts) {
+        for (const ncfUInt32 mode : kModes) {
+            Bytes parts(pixels);
+            LevelPass pass(layout.first, layout.second, parts.data(), parts.size(), mode);
+            pass.UpTo(0);
+            for (std::size_t end = 0; end < 4000; end += 8 * (random() % 12)) {
+                pass.UpTo(end);
+            }
+            pass.Finish();
+            EXPECT_EQ(parts, Remapped(layout.first, layout.second, pixels, mode)) << mode;
+        }
+    }
+}
+
+TEST(LevelPass, TouchesNothingBehindWhatItIsAskedFor) {
+    Bytes pixels(64, 100);
+    LevelPass pass(PF_BGRA, CT_UCHAR, pixels.data(), pixels.size(), Expand_Levels);
+    pass.UpTo(36);
+    EXPECT_EQ(pixels[35], 255);
+    EXPECT_EQ(Bytes(pixels.begin() + 36, pixels.end()), Bytes(28, 100));
+}
+
+// --- each set of kernels by itself ----------------------------------------------------------
+
+struct KernelSet {
+    const char* name;
+    const LevelKernels* kernels;
+    std::size_t block;
+};
+
+void PrintTo(const KernelSet& set, std::ostream* out) {
+    *out << set.name;
+}
+
+std::vector<KernelSet> KernelSets() {
+    std::vector<KernelSet> sets = {{"SSE2", &kLevelKernelsSse2, 16}};
+    if (const Avx2Kernels* const wide = FindAvx2Kernels()) {
+        sets.push_back({"AVX2", &wide->levels, 32});
+    }
+    return sets;
+}
+
+class LevelKernelTest : public testing::TestWithParam<KernelSet> {};
+INSTANTIATE_TEST_SUITE_P(PixelLevels, LevelKernelTest, testing::ValuesIn(KernelSets()));
+
+TEST_P(LevelKernelTest, EveryByteInEveryPlaceOfABlockAndMode) {
+    const std::size_t block = GetParam().block;
+    for (const ncfUInt32 mode : kModes) {
+        for (int value = 0; value < 256; ++value) {
+            Bytes pixels(block);
+            for (std::size_t i = 0; i < block; ++i) {
+                pixels[i] = static_cast<ncfUInt8>(static_cast<std::size_t>(value) * (2 * i + 1));
+            }
+            Bytes done(pixels);
+            ASSERT_EQ(GetParam().kernels->bytes(done.data(), block, mode), block);
+            for (std::size_t i = 0; i < block; ++i) {
+                ASSERT_EQ(done[i], i % 4 == 3 ? 255 : Mapped8(pixels[i], mode)) << i << " " << mode;
+            }
+        }
+    }
+}
+
+TEST_P(LevelKernelTest, EveryWordInEveryPlaceOfABlockAndMode) {
+    struct Layout {
+        LevelKernels::Kernel remap;
+        std::size_t alpha;
+        bool bigEndian;
+    };
+    const Layout layouts[] = {{GetParam().kernels->littleWords, 3, false},
+                              {GetParam().kernels->bigWords, 0, true}};
+    const std::size_t words = GetParam().block / 2;
+    for (const Layout& layout : layouts) {
+        for (const ncfUInt32 mode : kModes) {
+            // Odd factors: each place of a block meets every word.
+            const auto valueAt = [&](std::size_t word) {
+                return static_cast<ncfUInt16>(word / words * (word % words * 2 + 1));
+            };
+            Bytes pixels(65536 * words * 2);
+            for (std::size_t word = 0; word < 65536 * words; ++word) {
+                pixels[2 * word + !layout.bigEndian] = static_cast<ncfUInt8>(valueAt(word) >> 8);
+                pixels[2 * word + layout.bigEndian] = static_cast<ncfUInt8>(valueAt(word));
+            }
+            ASSERT_EQ(layout.remap(pixels.data(), pixels.size(), mode), pixels.size());
+            int wrong = 0;
+            for (std::size_t word = 0; word < 65536 * words; ++word) {
+                const auto got = static_cast<ncfUInt16>(pixels[2 * word + !layout.bigEndian] << 8 |
+                                                        pixels[2 * word + layout.bigEndian]);
+                wrong += got != (word % 4 == layout.alpha ? 65535 : Mapped16(valueAt(word), mode));
+            }
+            EXPECT_EQ(wrong, 0) << layout.alpha << " " << mode;
+        }
+    }
+}
+
+TEST_P(LevelKernelTest, DoesWholeBlocksOnly) {
+    const LevelKernels& kernels = *GetParam().kernels;
+    for (const auto kernel : {kernels.bytes, kernels.littleWords, kernels.bigWords}) {
+        for (const ncfUInt32 mode : kModes) {
+            for (std::size_t size = 0; size <= 100; ++size) {
+                const std::size_t whole = size / GetParam().block * GetParam().block;
+                Bytes pixels(size, 100);
+                ASSERT_EQ(kernel(pixels.data(), size, mode), whole);
+                ASSERT_EQ(Bytes(pixels.begin() + static_cast<std::ptrdiff_t>(whole), pixels.end()),
+                          Bytes(size - whole, 100));
+            }
         }
     }
 }

@@ -272,6 +272,67 @@ TEST_F(Delivery, WhatAReaderLeavesOutOfAConvertedFrameIsZero) {
     EXPECT_EQ(buffer->bytes, expected) << "nothing of the frame before";
 }
 
+TEST_F(Delivery, MemoryOfAConvertedFrameIsKeptForTheNextOne) {
+    Movie({kBGRAPixelFormat}, true);
+    Choose(1, 0);
+    Frame() = {1, 2, 3, 4, 5, 6, 7, 8};
+    EXPECT_EQ(Ask(1), NCF_OK);
+    const void* const first = wrapper->picture->destination;
+    EXPECT_EQ(first, mapping->scratch_.data());
+    Frame() = {1, 2, 3, 9};
+    EXPECT_EQ(Ask(1), NCF_OK);
+    EXPECT_EQ(wrapper->picture->destination, first) << "for a smaller one too";
+    Frame() = {1, 2, 3, 4, 5, 6, 7, 8};
+    EXPECT_EQ(Ask(1), NCF_OK);
+    EXPECT_EQ(wrapper->picture->destination, first);
+    EXPECT_EQ(buffer->bytes, (Bytes{4, 8}));
+}
+
+TEST_F(Delivery, FailedReadLeavesNothingInTheNextConvertedFrame) {
+    Movie({kBGRAPixelFormat}, true);
+    Choose(1, 0);
+    Frame() = {9, 9, 9, 9, 9, 9, 9, 9};
+    EXPECT_EQ(Ask(1), NCF_OK);
+    wrapper->picture->results["ReadFrame"] = NCF_E_FAIL;
+    EXPECT_EQ(Ask(1), NCF_E_FAIL);
+    wrapper->picture->results.clear();
+    wrapper->picture->frameSize = 8;
+    Frame() = {1, 2, 3, 4};
+    EXPECT_EQ(Ask(1), NCF_OK);
+    EXPECT_EQ(buffer->bytes, (Bytes{4, 0}));
+}
+
+TEST_F(Delivery, LevelsReachWhatAConversionLeavesOut) {
+    Movie({kr4flPixelFormat});
+    Choose(0, 0);
+    Frame().assign(31, 0);  // no whole row
+    mapping->levelRemap_ = Expand_Levels;
+    EXPECT_EQ(Ask(0), NCF_OK);
+    const auto word = static_cast<ncfUInt16>((0xAAAA - 4096) * 1.1688453);
+    const auto high = static_cast<ncfUInt8>(word >> 8);
+    const auto low = static_cast<ncfUInt8>(word);
+    EXPECT_EQ(buffer->bytes, (Bytes{255, 255, high, low, high, low, high, low, 255, 255, high, low,
+                                    high, low, high, low}));
+}
+
+TEST_F(Delivery, ConvertedFrameOfAnUndefinedFormatHasNoLevels) {
+    Movie({kr4flPixelFormat});
+    QTImageFormat format = Format(0, 0);
+    format.componentFormat = CT_UNDEFINED;
+    mapping->mediaTracks_[0]->AddFormat(format);
+    Choose(0, 1);
+    mapping->levelRemap_ = Expand_Levels;
+    Frame().assign(32, 0);
+    EXPECT_EQ(Ask(0), NCF_E_FAIL);
+    EXPECT_TRUE(
+        log->once(Check("NCFASSERT( CT_UNDEFINED != componentType )", "ProvideSampleRange")));
+    EXPECT_FALSE(buffer->complete);
+    EXPECT_EQ(buffer->bytes[0], 0) << "alpha as it was read";
+    EXPECT_EQ(buffer->bytes[1], 0);
+    EXPECT_EQ((Bytes(buffer->bytes.begin() + 4, buffer->bytes.begin() + 6)), (Bytes{0x94, 0x6F}))
+        << "green of no colour at all, in video range";
+}
+
 TEST_F(Delivery, PictureWhoseSizeWrapsIsCutToTheBuffer) {
     Movie({kBGRAPixelFormat});
     Choose(0, 0);

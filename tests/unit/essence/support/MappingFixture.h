@@ -29,6 +29,7 @@ public:
     using QuickTimeSampleMapping::media_;
     using QuickTimeSampleMapping::mediaTracks_;
     using QuickTimeSampleMapping::QuickTimeSampleMapping;
+    using QuickTimeSampleMapping::scratch_;
 };
 
 // Calls itself sound, but can't keep a channel count.
