@@ -21,8 +21,8 @@ void Try(Call call) {
     }
 }
 
-template <class Item, class Parent, class Visit>
-void ForSome(ncfUInt32 count, NCFRESULT (Parent::*at)(ncfUInt32, Item&) const, const Parent& parent,
+template <class List, class Item, class Parent, class Visit>
+void ForSome(ncfUInt32 count, NCFRESULT (List::*at)(ncfUInt32, Item&) const, const Parent& parent,
              Visit visit) {
     for (ncfUInt32 i = 0; i < count && i < kEnough; ++i) {
         Item item;
