@@ -73,26 +73,27 @@ nlohmann::ordered_json ToJson(const ClipParameter& parameter, const FileFields& 
             {"choices", std::move(choices)}};
 }
 
-void Print(ClipParameters& parameters, const ParamsOptions& options, const FileFields& file) {
-    if (!options.xml.empty()) {
-        fmt::print("{}\n", parameters.Xml(kXml.at(options.xml)));
-        return;
+// What the verb tells of a movie.
+struct ShownParameters {
+    std::string set;
+    std::vector<ClipParameter> list;
+    FileFields file;  // before the user's values count
+};
+
+void PrintText(const std::filesystem::path& movie, const ShownParameters& shown) {
+    fmt::print("{}: {}\n", DisplayPath(movie), host::ShownText(shown.set, kLongestName));
+    for (const ClipParameter& parameter : shown.list) {
+        PrintParameter(parameter, shown.file);
     }
-    const std::vector<ClipParameter> list = parameters.List();
-    const std::string set = parameters.SetName();
-    if (!options.json) {
-        fmt::print("{}: {}\n", DisplayPath(options.movie), host::ShownText(set, kLongestName));
-        for (const ClipParameter& parameter : list) {
-            PrintParameter(parameter, file);
-        }
-        return;
-    }
-    nlohmann::ordered_json json = {{"movie", MachinePath(options.movie)}};
-    AddRoute(options.movie, json);
-    json["set"] = set;
+}
+
+void PrintAsJson(const std::filesystem::path& movie, const ShownParameters& shown) {
+    nlohmann::ordered_json json = {{"movie", MachinePath(movie)}};
+    AddRoute(movie, json);
+    json["set"] = shown.set;
     json["parameters"] = nlohmann::ordered_json::array();
-    for (const ClipParameter& parameter : list) {
-        json["parameters"].push_back(ToJson(parameter, file));
+    for (const ClipParameter& parameter : shown.list) {
+        json["parameters"].push_back(ToJson(parameter, shown.file));
     }
     PrintJson(json);
 }
@@ -121,15 +122,21 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
             // A container takes parameters also for what is no movie.
             const Description description =
                 DescribeContainer(running, container.get(), options->movie);
-            // Before the user's values count.
-            const FileFields file = ReadFileFields(*container);
-            if (description.problem && file.order.empty()) {
+            ShownParameters shown;
+            shown.file = ReadFileFields(*container);
+            if (description.problem && shown.file.order.empty()) {
                 throw Failure(description.problem);
             }
             TellRoute(options->movie, running.verbosity());
             ClipParameters parameters(running, options->movie, *container);
             options->parameters.ApplyTo(parameters);
-            Print(parameters, *options, file);
+            if (!options->xml.empty()) {
+                fmt::print("{}\n", parameters.Xml(kXml.at(options->xml)));
+                return;
+            }
+            shown.list = parameters.List();
+            shown.set = parameters.SetName();
+            (options->json ? PrintAsJson : PrintText)(options->movie, shown);
         });
     });
 }
