@@ -19,24 +19,26 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// A short movie with one picture and one sound track, deleted when the process ends.
+// A short movie with one picture and one sound track in a folder of its own, deleted when the
+// process ends.
 class ShortMovie {
 public:
     ShortMovie()
-        : path_(fs::temp_directory_path() /
-                ("bench-program-" + std::to_string(getpid()) + ".mov")) {
+        : folder_(fs::temp_directory_path() / ("bench-program-" + std::to_string(getpid()))) {
+        fs::create_directories(folder_);
         movies::Movie movie;
         movies::VideoFormat format;
         format.codec = "apcn";
         movie.tracks.push_back(movies::VideoTrack(format, 50, 25, 1));
         movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 96000));
-        movies::Build(movie).WriteTo(path_.string());
+        movies::Build(movie).WriteTo((folder_ / "short.mov").string());
     }
-    ~ShortMovie() { fs::remove(path_); }
-    std::string Path() const { return Quoted(path_); }
+    ~ShortMovie() { fs::remove_all(folder_); }
+    std::string Folder() const { return Quoted(folder_); }
+    std::string Path() const { return Quoted(folder_ / "short.mov"); }
 
 private:
-    fs::path path_;
+    fs::path folder_;
 };
 
 const ShortMovie& TheMovie() {
@@ -72,7 +74,7 @@ void Plugin(benchmark::State& state) {
     Run(state, Cliphost("plugin"));
 }
 void Scan(benchmark::State& state) {
-    Run(state, Cliphost("scan " + TheMovie().Path()));
+    Run(state, Cliphost("scan " + TheMovie().Folder()));
 }
 void Describe(benchmark::State& state) {
     Run(state, Cliphost("describe " + TheMovie().Path()));

@@ -14,7 +14,7 @@ namespace {
 
 using header_parser::FileBytes;
 
-constexpr ncfUInt64 kLength = 10000;
+constexpr ncfUInt64 kLength = 20000;
 
 ncfUInt8 ByteAt(ncfUInt64 position) {
     return static_cast<ncfUInt8>(position * 7 % 251);
