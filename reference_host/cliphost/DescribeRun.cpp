@@ -6,7 +6,6 @@
 
 #include <algorithm>
 #include <nlohmann/json.hpp>
-#include <optional>
 
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Notice.h"
@@ -14,7 +13,6 @@
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PrivateFile.h"
-#include "reference_host/cliphost/Progress.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -45,6 +43,24 @@ std::string EntryText(const ordered_json& head, const std::string& description) 
 }
 
 }  // namespace
+
+template <class Work>
+void DescribeRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work& work) {
+    try {
+        work();
+    } catch (const Failure& failure) {
+        ++failed_;
+        status_ = std::max(status_, failure.status());
+        TellProblem(failure.problem(), session_.verbosity());
+        if (options_.form.json) {
+            ordered_json head = {{"movie", MachinePath(movie)}};
+            AddProblem(failure.problem(), head);
+            entries_.push_back(EntryText(head, ""));
+        }
+    } catch (const ReaderGone&) {
+        // It has seen enough.
+    }
+}
 
 int DescribeRun::Run() {
     std::optional<OutputFolder> folder;
@@ -105,9 +121,9 @@ void DescribeRun::Refuse(const std::filesystem::path& path, int status, const Pr
 }
 
 void DescribeRun::DescribeHere() {
-    Progress progress(kProgress, steps_.size());
+    progress_.emplace(kProgress, steps_.size());
     for (const Step& step : steps_) {
-        progress.Step(DisplayPath(step.movie.filename()));
+        progress_->Step(DisplayPath(step.movie.filename()));
         if (!step.IsMovie()) {
             TellInstead(step);
             continue;
@@ -125,16 +141,16 @@ void DescribeRun::DescribeHere() {
             Show(step.movie, answer, saved);
         });
     }
+    progress_.reset();
 }
 
 void DescribeRun::DescribeInWorkers() {
     std::vector<std::string> requests;
-    std::vector<std::size_t> places;  // of the requests among the steps
     for (std::size_t i = 0; i < steps_.size(); ++i) {
         if (steps_[i].IsMovie()) {
             steps_[i].folder.reset();
             requests.push_back(steps_[i].movie.native());
-            places.push_back(i);
+            placesOfRequests_.push_back(i);
         }
     }
     WorkerCall call = options_.workers;
@@ -142,24 +158,53 @@ void DescribeRun::DescribeInWorkers() {
         call.writeNear = options_.outFolder.empty() ? std::filesystem::temp_directory_path()
                                                     : options_.outFolder;
     }
-    std::size_t next = 0;
-    const auto tellThoseBefore = [&](std::size_t place) {
-        for (; next < place; ++next) {
-            TellInstead(steps_[next]);
+    progress_.emplace(kProgress, requests.size());
+    RunInWorkers(call, requests, *this);
+    progress_.reset();
+    TellThoseBefore(steps_.size());
+}
+
+void DescribeRun::TellThoseBefore(std::size_t place) {
+    for (; nextPlace_ < place; ++nextPlace_) {
+        TellInstead(steps_[nextPlace_]);
+    }
+}
+
+void DescribeRun::Begin(std::size_t number) {
+    progress_->Step(DisplayPath(steps_[placesOfRequests_[number]].movie.filename()));
+}
+
+bool DescribeRun::Read(std::size_t number, const std::string& answer) {
+    return FromBytes(answer, options_.form, answers_[number]);
+}
+
+void DescribeRun::Take(std::size_t number, const WorkerResult& result) {
+    const std::size_t place = placesOfRequests_[number];
+    TellThoseBefore(place);
+    ++nextPlace_;
+    Notice("{}", result.told);
+    GoOnAfterFailure(steps_[place].movie, [&] { Deliver(steps_[place], number, result); });
+    answers_.erase(number);
+}
+
+void DescribeRun::Deliver(const Step& step, std::size_t number, const WorkerResult& result) {
+    if (!result.failure.empty()) {
+        throw Failure(kExitFile, step.movie, result.failure);
+    }
+    MovieAnswer& answer = answers_[number];
+    std::filesystem::path saved;
+    if (Saves()) {
+        const std::filesystem::path file = PrivateFile(result.folder, number);
+        const bool isSaved = answer.status == kExitFine;
+        const bool isNotSaved = !isSaved && answer.problem.subject == file;
+        saved = isSaved || isNotSaved ? TargetFor(step.movie) : saved;
+        if (isNotSaved) {
+            answer.problem.subject = saved;
+        } else if (isSaved) {
+            PutIntoPlace(file, saved);
         }
-    };
-    Progress progress(kProgress, requests.size());
-    RunInWorkers(
-        call, requests,
-        [&](std::size_t number) {
-            progress.Step(DisplayPath(steps_[places[number]].movie.filename()));
-        },
-        [&](std::size_t number, const WorkerResult& result) {
-            tellThoseBefore(places[number]);
-            ++next;
-            TakeResult(steps_[places[number]], number, result);
-        });
-    tellThoseBefore(steps_.size());
+    }
+    Show(step.movie, answer, saved);
 }
 
 void DescribeRun::TellInstead(const Step& step) {
@@ -167,51 +212,6 @@ void DescribeRun::TellInstead(const Step& step) {
         TellProblem(*step.notice, session_.verbosity());
     } else {
         GoOnAfterFailure(step.movie, [&] { throw *step.refusal; });
-    }
-}
-
-void DescribeRun::TakeResult(const Step& step, std::size_t number, const WorkerResult& result) {
-    Notice("{}", result.told);
-    GoOnAfterFailure(step.movie, [&] {
-        if (!result.failure.empty()) {
-            throw Failure(kExitFile, step.movie, result.failure);
-        }
-        MovieAnswer answer;
-        if (!FromBytes(result.answer, options_.form, answer)) {
-            throw Failure(kExitFile, step.movie,
-                          "the process that read it gave an answer that is none");
-        }
-        std::filesystem::path saved;
-        if (Saves()) {
-            const std::filesystem::path file = PrivateFile(result.folder, number);
-            const bool isSaved = answer.status == kExitFine;
-            const bool isNotSaved = !isSaved && answer.problem.subject == file;
-            saved = isSaved || isNotSaved ? TargetFor(step.movie) : saved;
-            if (isNotSaved) {
-                answer.problem.subject = saved;
-            } else if (isSaved) {
-                PutIntoPlace(file, saved);
-            }
-        }
-        Show(step.movie, answer, saved);
-    });
-}
-
-template <class Work>
-void DescribeRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work& work) {
-    try {
-        work();
-    } catch (const Failure& failure) {
-        ++failed_;
-        status_ = std::max(status_, failure.status());
-        TellProblem(failure.problem(), session_.verbosity());
-        if (options_.form.json) {
-            ordered_json head = {{"movie", MachinePath(movie)}};
-            AddProblem(failure.problem(), head);
-            entries_.push_back(EntryText(head, ""));
-        }
-    } catch (const ReaderGone&) {
-        // It has seen enough.
     }
 }
 

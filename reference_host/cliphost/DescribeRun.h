@@ -3,13 +3,16 @@
 #pragma once
 
 #include <filesystem>
+#include <map>
 #include <memory>
+#include <optional>
 #include <set>
 #include <string>
 #include <vector>
 
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/MovieAnswer.h"
+#include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/Workers.h"
 
 namespace cliphost {
@@ -24,7 +27,7 @@ struct DescribeOptions {
 
 // Describes all movies of the command line; a bad one does not stop the rest. Several are
 // given to processes of their own where the options say so.
-class DescribeRun {
+class DescribeRun : private WorkerClient {
 public:
     DescribeRun(Session& session, const DescribeOptions& options)
         : session_(session), options_(options) {}
@@ -49,7 +52,11 @@ private:
     void DescribeHere();
     void DescribeInWorkers();
     void TellInstead(const Step& step);
-    void TakeResult(const Step& step, std::size_t number, const WorkerResult& result);
+    void TellThoseBefore(std::size_t place);
+    void Begin(std::size_t number) override;
+    bool Read(std::size_t number, const std::string& answer) override;
+    void Take(std::size_t number, const WorkerResult& result) override;
+    void Deliver(const Step& step, std::size_t number, const WorkerResult& result);
     // Does one movie; what it fails with is told, and the next one goes on.
     template <class Work>
     void GoOnAfterFailure(const std::filesystem::path& movie, const Work& work);
@@ -62,6 +69,10 @@ private:
     Session& session_;
     const DescribeOptions& options_;
     std::vector<Step> steps_;
+    std::vector<std::size_t> placesOfRequests_;  // among the steps
+    std::size_t nextPlace_ = 0;
+    std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
+    std::optional<Progress> progress_;
     std::set<std::filesystem::path> targetsTaken_;
     std::vector<std::string> entries_;  // of the JSON list
     int described_ = 0;

@@ -30,6 +30,7 @@ constexpr char kEndOfMovie = '\0';
 constexpr std::size_t kMostTold = std::size_t{16} << 20;
 // Results that wait for one before them; more movies are not begun.
 constexpr std::size_t kMostWaiting = 256;
+constexpr char kNoAnswer[] = "the process that read it gave an answer that is none";
 constexpr std::size_t kMebibyte = std::size_t{1} << 20;
 
 struct Worker {
@@ -58,10 +59,8 @@ std::string TakeTold(Worker& worker) {
 
 class Run {
 public:
-    Run(const WorkerCall& call, const std::vector<std::string>& requests,
-        const std::function<void(std::size_t)>& begin,
-        const std::function<void(std::size_t, const WorkerResult&)>& take)
-        : call_(call), requests_(requests), begin_(begin), take_(take) {
+    Run(const WorkerCall& call, const std::vector<std::string>& requests, WorkerClient& client)
+        : call_(call), requests_(requests), client_(client) {
         MakeScratchFolder();
         const std::size_t most = std::min<std::size_t>(call.jobs, requests.size());
         for (std::size_t i = 0; i < most; ++i) {
@@ -78,16 +77,15 @@ private:
     std::optional<std::size_t> NextRequest();
     void Wait();
     void Listen(Worker& worker);
-    void Hear(Worker& worker, std::string message);
+    void Hear(Worker& worker, const std::string& message);
     void HoldToLimits(Worker& worker);
     // Ends the process; what it was at has failed, what it has not begun goes to another.
     void Lose(Worker& worker, const std::string& why);
-    void Settle(Worker& worker, WorkerResult result);
+    void Settle(Worker& worker, const std::string& failure);
 
     const WorkerCall& call_;
     const std::vector<std::string>& requests_;
-    const std::function<void(std::size_t)>& begin_;
-    const std::function<void(std::size_t, const WorkerResult&)>& take_;
+    WorkerClient& client_;
     std::optional<host::system::ScratchFolder> scratch_;
     std::size_t foldersMade_ = 0;
     std::vector<std::unique_ptr<Worker>> workers_;
@@ -126,7 +124,7 @@ void Run::GoOn() {
         }
         for (auto first = waiting_.find(taken_); first != waiting_.end();
              first = waiting_.find(taken_)) {
-            take_(first->first, first->second);
+            client_.Take(first->first, first->second);
             waiting_.erase(first);
             ++taken_;
         }
@@ -168,7 +166,7 @@ std::optional<std::size_t> Run::NextRequest() {
     if (next_ == requests_.size() || next_ - taken_ >= kMostWaiting) {
         return std::nullopt;
     }
-    begin_(next_);
+    client_.Begin(next_);
     return next_++;
 }
 
@@ -209,13 +207,13 @@ void Run::Listen(Worker& worker) {
     const bool isOpen = worker.process.Receive(worker.messages.arrived());
     worker.process.ReceiveErrors(worker.errors, kMostTold);
     while (std::optional<std::string> message = worker.messages.Next()) {
-        Hear(worker, std::move(*message));
+        Hear(worker, *message);
         if (!worker.process.IsRunning()) {
             return;
         }
     }
     if (worker.messages.IsBroken()) {
-        Lose(worker, "the process that read it gave an answer that is none");
+        Lose(worker, kNoAnswer);
     } else if (!isOpen) {
         Lose(worker, EndInWords(worker.process.End()));
     } else {
@@ -223,7 +221,7 @@ void Run::Listen(Worker& worker) {
     }
 }
 
-void Run::Hear(Worker& worker, std::string message) {
+void Run::Hear(Worker& worker, const std::string& message) {
     if (!worker.isReady) {
         worker.isReady = true;
         worker.since = Clock::now();
@@ -246,7 +244,11 @@ void Run::Hear(Worker& worker, std::string message) {
         HoldToLimits(worker);
         return;
     }
-    Settle(worker, {{}, std::move(message), {}, {}});
+    if (!client_.Read(worker.requests.front(), message)) {
+        Lose(worker, kNoAnswer);
+        return;
+    }
+    Settle(worker, "");
     // What it holds would be laid to the movies after this one.
     if (needed > most / 2) {
         worker.process.End();
@@ -276,15 +278,14 @@ void Run::Lose(Worker& worker, const std::string& why) {
     if (worker.requests.empty()) {
         return;
     }
-    Settle(worker, {{}, {}, why, {}});
+    Settle(worker, why);
     again_.insert(again_.end(), worker.requests.begin(), worker.requests.end());
     worker.requests.clear();
 }
 
-void Run::Settle(Worker& worker, WorkerResult result) {
-    result.told = TakeTold(worker);
-    result.folder = worker.folder;
-    waiting_.emplace(worker.requests.front(), std::move(result));
+void Run::Settle(Worker& worker, const std::string& failure) {
+    waiting_.emplace(worker.requests.front(),
+                     WorkerResult{TakeTold(worker), failure, worker.folder});
     worker.requests.pop_front();
     worker.since = Clock::now();
 }
@@ -292,11 +293,10 @@ void Run::Settle(Worker& worker, WorkerResult result) {
 }  // namespace
 
 void RunInWorkers(const WorkerCall& call, const std::vector<std::string>& requests,
-                  const std::function<void(std::size_t)>& begin,
-                  const std::function<void(std::size_t, const WorkerResult&)>& take) {
+                  WorkerClient& client) {
     // Takes effect once processes and folders are gone.
     const host::system::DelayedSignals signals;
-    Run(call, requests, begin, take).GoOn();
+    Run(call, requests, client).GoOn();
 }
 
 bool ServeAsWorker(const std::filesystem::path& folder,

@@ -36,17 +36,26 @@ struct WorkerCall {
 // What became of one request.
 struct WorkerResult {
     std::string told;              // what the process wrote on standard error
-    std::string answer;            // anything at all: the process has met the movie
     std::string failure;           // what became of the process, where it gave no answer
     std::filesystem::path folder;  // that it could write
 };
 
-// Gives requests to processes and their results to `take`, in the order of the requests;
-// `begin` hears of each request that is handed over. Throws a Failure when no process can
-// be started.
+// Whoever has requests, each known by its number from 0.
+class WorkerClient {
+public:
+    virtual ~WorkerClient() = default;
+    // The request is handed to a process.
+    virtual void Begin(std::size_t number) = 0;
+    // Keeps an answer, which may be anything: the process has met the movie. False for what is
+    // none; the process then ends. Answers come in any order.
+    virtual bool Read(std::size_t number, const std::string& answer) = 0;
+    // The result, in the order of the requests.
+    virtual void Take(std::size_t number, const WorkerResult& result) = 0;
+};
+
+// Gives requests to processes. Throws a Failure when none can be started.
 void RunInWorkers(const WorkerCall& call, const std::vector<std::string>& requests,
-                  const std::function<void(std::size_t)>& begin,
-                  const std::function<void(std::size_t, const WorkerResult&)>& take);
+                  WorkerClient& client);
 
 // The other side, in the child: gives up all rights but to write in a folder, which may be
 // empty, and answers requests, which come with their number, until the parent has no more.
