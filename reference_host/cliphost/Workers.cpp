@@ -73,7 +73,9 @@ public:
 private:
     void MakeScratchFolder();
     void HandOut();
-    void Start(Worker& worker);
+    void HandTo(Worker& worker, std::size_t request);
+    // False where the system has room for no more of them.
+    bool Start(Worker& worker);
     std::optional<std::size_t> NextRequest();
     void Wait();
     void Listen(Worker& worker);
@@ -135,26 +137,33 @@ void Run::HandOut() {
     // The next request lies ready where a process ends one, unless what it needs is measured.
     const std::size_t most = call_.limits.mebibytes != 0 ? 1 : 2;
     for (std::size_t depth = 1; depth <= most; ++depth) {
-        for (const auto& worker : workers_) {
-            if (worker->requests.size() >= depth) {
+        for (std::size_t i = 0; i < workers_.size(); ++i) {
+            Worker& worker = *workers_[i];
+            if (worker.requests.size() >= depth) {
                 continue;
             }
             const std::optional<std::size_t> request = NextRequest();
             if (!request) {
                 return;
             }
-            if (!worker->process.IsRunning()) {
-                Start(*worker);
+            if (!worker.process.IsRunning() && !Start(worker)) {
+                again_.push_front(*request);
+                workers_.erase(workers_.begin() + static_cast<std::ptrdiff_t>(i));
+                return;  // the others have to do
             }
-            if (worker->requests.empty()) {
-                worker->since = Clock::now();
-            }
-            worker->requests.push_back(*request);
-            // A process that takes nothing has ended; Listen finds that.
-            worker->process.Send(
-                FieldWriter().Add(std::uint64_t{*request}).Add(requests_[*request]).Message());
+            HandTo(worker, *request);
         }
     }
+}
+
+void Run::HandTo(Worker& worker, std::size_t request) {
+    if (worker.requests.empty()) {
+        worker.since = Clock::now();
+    }
+    worker.requests.push_back(request);
+    // A process that takes nothing has ended; Listen finds that.
+    worker.process.Send(
+        FieldWriter().Add(std::uint64_t{request}).Add(requests_[request]).Message());
 }
 
 std::optional<std::size_t> Run::NextRequest() {
@@ -170,7 +179,7 @@ std::optional<std::size_t> Run::NextRequest() {
     return next_++;
 }
 
-void Run::Start(Worker& worker) {
+bool Run::Start(Worker& worker) {
     worker.messages = {};
     worker.errors.clear();
     worker.isReady = false;
@@ -181,12 +190,14 @@ void Run::Start(Worker& worker) {
         std::filesystem::create_directory(worker.folder, error);
         arguments.push_back("--folder=" + worker.folder.native());
     }
-    if (const int error = worker.process.Start(call_.program, arguments)) {
+    const int error = worker.process.Start(call_.program, arguments);
+    if (error != 0 && workers_.size() == 1) {
         throw Failure(
             kExitCaller, call_.program,
             "no further process can be started: " + std::generic_category().message(error),
             "try --jobs 1");
     }
+    return error == 0;
 }
 
 void Run::Wait() {

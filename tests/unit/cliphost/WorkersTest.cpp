@@ -7,6 +7,7 @@
 #include "reference_host/cliphost/Workers.h"
 
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 
 #include <map>
 #include <vector>
@@ -155,6 +156,17 @@ TEST(Workers, FailWhereNoProcessStarts) {
     call.program = "/no/such/program";
     Client client;
     EXPECT_THROW(RunInWorkers(call, {"x"}, client), Failure);
+}
+
+TEST(Workers, AreAsManyAsTheSystemHasRoomFor) {
+    rlimit before{};
+    ASSERT_EQ(getrlimit(RLIMIT_NOFILE, &before), 0);
+    const rlimit few{40, before.rlim_max};
+    ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &few), 0);
+    const Client client =
+        RunShells(Ready() + "while true\ndo\n" + Request() + Answer("fine") + "done\n", 100, 100);
+    ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &before), 0);
+    EXPECT_EQ(client.answers.size(), 100u);
 }
 
 TEST(Workers, HaveNothingToDoWithoutRequests) {
