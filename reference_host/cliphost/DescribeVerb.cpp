@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
+#include "reference_host/quicktime/MovieComponents.h"
 #include "reference_host/system/OutputStream.h"
 
 namespace cliphost {
@@ -41,6 +42,9 @@ MovieAnswer AnswerTo(Session& session, const std::filesystem::path& movie,
     } catch (const Failure& failure) {
         answer.status = failure.status();
         answer.problem = failure.problem();
+    } catch (const host::MovieLibraryMissing& missing) {
+        answer.status = kExitCaller;
+        answer.problem = {movie, missing.what(), "install cliphost anew, with all its files"};
     } catch (const std::exception& error) {
         answer.status = kExitFile;
         answer.problem = {movie, error.what()};
