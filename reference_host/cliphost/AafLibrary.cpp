@@ -5,7 +5,6 @@
 
 #include <fmt/format.h>
 
-#include <fstream>
 #include <system_error>
 
 #include "host_interfaces/Version.h"
@@ -13,6 +12,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
+#include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
@@ -103,7 +103,6 @@ bool AafLibrary::PinTime(const aafTimeStamp_t& time) {
 
 // The library writes files alone, so a device takes the bytes of one.
 void AafLibrary::SaveToDevice(IAAFFile* file, const std::filesystem::path& device) const {
-    OutputFile output(device);
     std::error_code error;
     const host::system::ScratchFolder scratch(error);
     if (error) {
@@ -113,12 +112,7 @@ void AafLibrary::SaveToDevice(IAAFFile* file, const std::filesystem::path& devic
     }
     const std::filesystem::path clip = scratch.path() / "clip.aaf";
     Save(file, clip);
-    std::ifstream saved(clip, std::ios::binary);
-    char piece[65536];
-    while (saved.read(piece, sizeof piece), saved.gcount() > 0) {
-        output.Write(piece, static_cast<std::size_t>(saved.gcount()));
-    }
-    output.Finish();
+    PutIntoPlace(clip, device);
 }
 
 void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {

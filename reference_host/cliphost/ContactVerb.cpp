@@ -108,7 +108,8 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
         app.add_subcommand("contact", "Write a contact sheet: thumbnails from the whole movie");
     verb->footer(
         "Example: cliphost contact clip.mov -o sheet.png\n"
-        "With --use-alpha transparent parts show a checkerboard.");
+        "With --use-alpha transparent parts show a checkerboard.\n"
+        "One process makes the sheet; --jobs is for `cliphost describe`.");
     auto options = std::make_shared<ContactOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
     verb->add_option("-o,--output", options->output, "The PNG file, or - for standard output")

@@ -17,6 +17,7 @@ namespace cliphost {
 
 // What the command line says for all verbs.
 struct SessionOptions {
+    std::filesystem::path program;        // the file that runs
     std::filesystem::path programFolder;  // where module and library lie
     std::filesystem::path plugin;         // empty: beside the program
     std::filesystem::path aafLibrary;     // empty: beside the program

@@ -60,7 +60,8 @@ std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
 int Run(int argc, char** argv) {
     using namespace cliphost;
     SessionOptions session;
-    session.programFolder = host::system::ProgramFile(argv[0]).parent_path();
+    session.program = host::system::ProgramFile(argv[0]);
+    session.programFolder = session.program.parent_path();
     int status = kExitFine;
 
     CLI::App app{

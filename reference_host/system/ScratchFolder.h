@@ -7,10 +7,12 @@
 
 namespace host::system {
 
-// A folder of our own among the temporary files, gone with what is in it.
+// A folder of our own among the temporary files or in another folder, gone with what is
+// in it.
 class ScratchFolder {
 public:
     explicit ScratchFolder(std::error_code& error);
+    ScratchFolder(const std::filesystem::path& parent, std::error_code& error);
     ~ScratchFolder();
     ScratchFolder(const ScratchFolder&) = delete;
     ScratchFolder& operator=(const ScratchFolder&) = delete;

@@ -7,8 +7,11 @@
 
 namespace host::system {
 
-ScratchFolder::ScratchFolder(std::error_code& error) {
-    std::string name = std::filesystem::temp_directory_path() / "cliphost-XXXXXX";
+ScratchFolder::ScratchFolder(std::error_code& error)
+    : ScratchFolder(std::filesystem::temp_directory_path(), error) {}
+
+ScratchFolder::ScratchFolder(const std::filesystem::path& parent, std::error_code& error) {
+    std::string name = parent / "cliphost-XXXXXX";
     if (mkdtemp(name.data()) == nullptr) {
         error.assign(errno, std::generic_category());
         return;

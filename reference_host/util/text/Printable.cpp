@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/util/text/Printable.h"
 
+#include <algorithm>
+
 #include "text/Encodings.h"
 
 namespace host::text {
@@ -54,6 +56,12 @@ bool IsControl(char32_t c) {
 namespace {
 
 std::string Escaped(std::string_view utf8, bool keepsLineEnds) {
+    const bool isPlain = std::all_of(utf8.begin(), utf8.end(), [&](char c) {
+        return (c >= ' ' && c <= '~') || (keepsLineEnds && c == '\n');
+    });
+    if (isPlain) {
+        return std::string(utf8);
+    }
     std::string out;
     out.reserve(utf8.size());
     for (const char32_t c : encodings::FromUtf8(utf8)) {

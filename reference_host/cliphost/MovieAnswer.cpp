@@ -1,0 +1,113 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/MovieAnswer.h"
+
+#include <nlohmann/json.hpp>
+
+#include "reference_host/cliphost/AafTree.h"
+#include "reference_host/cliphost/Fields.h"
+#include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/RouteTaken.h"
+#include "reference_host/util/text/Printable.h"
+
+namespace cliphost {
+namespace {
+
+// An entry of the list has two levels above it.
+std::string InEntry(const std::string& json) {
+    std::string text;
+    text.reserve(json.size() + json.size() / 4);
+    for (const char c : json) {
+        text += c;
+        if (c == '\n') {
+            text += "    ";
+        }
+    }
+    return text;
+}
+
+bool IsRoute(const std::string& text) {
+    for (const char* const known : {"", route::kHeader, route::kLibrary, route::kNone}) {
+        if (text == known) {
+            return true;
+        }
+    }
+    return false;
+}
+
+}  // namespace
+
+MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
+                     const std::function<std::filesystem::path()>& place) {
+    MovieAnswer answer;
+    answer.problem = description.file ? description.doubt : description.problem;
+    if (!description.file) {
+        answer.status = StatusOf(description.problem);
+        return answer;
+    }
+    if (description.doubt) {
+        TellProblem(description.doubt, session.verbosity());
+    }
+    const std::filesystem::path saved = place();
+    host::Ref<IAAFFile> shown = description.file;
+    if (!saved.empty()) {
+        const bool isDevice = OutputFile::IsDevice(saved);
+        session.aaf().Save(description.file.get(), saved);
+        // What is shown is what any reader of the saved file finds.
+        shown = isDevice ? shown : session.aaf().Open(saved);
+    }
+    TellRoute(description.movie, session.verbosity());
+    if (host::system::IsStandardOutput(saved)) {
+        return answer;  // what is shown would be in the midst of the file
+    }
+    if (form.json) {
+        const RouteTaken taken = RouteOf(description.movie);
+        answer.route = taken.route;
+        answer.routeReason = taken.reason;
+        answer.description = InEntry(ToJson(ReadTree(shown.get())));
+    } else if (!form.quiet) {
+        answer.description = ToReadableText(ReadTree(shown.get()), 1);
+    }
+    return answer;
+}
+
+std::string ToBytes(const MovieAnswer& answer) {
+    const Problem& problem = answer.problem;
+    return FieldWriter()
+        .Add(static_cast<std::uint64_t>(answer.status))
+        .Add(problem.subject.native())
+        .Add(problem.reason)
+        .Add(problem.hint)
+        .Add(static_cast<ncfUInt32>(problem.code))
+        .Add(problem.route)
+        .Add(answer.route)
+        .Add(answer.routeReason)
+        .Add(answer.description)
+        .bytes();
+}
+
+bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer& answer) {
+    FieldReader fields(bytes);
+    const std::uint64_t status = fields.Number();
+    Problem& problem = answer.problem;
+    problem.subject = fields.Text();
+    problem.reason = fields.Text();
+    problem.hint = fields.Text();
+    problem.code = static_cast<NCFRESULT>(fields.Number());
+    problem.route = fields.Text();
+    answer.route = fields.Text();
+    answer.routeReason = fields.Text();
+    answer.description = fields.Text();
+    if (!fields.IsWhole() || status > kExitCaller || !IsRoute(answer.route) ||
+        !IsRoute(problem.route) || (status != kExitFine && !problem)) {
+        return false;
+    }
+    answer.status = static_cast<int>(status);
+    if (form.json) {
+        return status != kExitFine || nlohmann::json::accept(answer.description);
+    }
+    answer.description = host::text::PrintableLines(answer.description);
+    return true;
+}
+
+}  // namespace cliphost

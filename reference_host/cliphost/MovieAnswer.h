@@ -1,0 +1,40 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <functional>
+#include <string>
+#include <string_view>
+
+#include "reference_host/cliphost/Describe.h"
+#include "reference_host/cliphost/Failure.h"
+
+namespace cliphost {
+
+// How descriptions are shown.
+struct DescriptionForm {
+    bool json = false;
+    bool quiet = false;
+};
+
+// What a verb shows of one movie, whichever process described it.
+struct MovieAnswer {
+    int status = kExitFine;
+    Problem problem;          // why it is not described; or what its header tells wrong
+    std::string route;        // for JSON alone
+    std::string routeReason;  // empty on the first route
+    std::string description;  // text, or JSON indented as part of an entry; empty where not shown
+};
+
+// Tells on standard error what is told of a movie that is described, saves the description
+// where `place` says, which may be nowhere, and reads it.
+MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
+                     const std::function<std::filesystem::path()>& place);
+
+// From one process to another. What is read may come from a process that a movie has broken:
+// texts for people are escaped again, and JSON is well-formed; false for anything else.
+std::string ToBytes(const MovieAnswer& answer);
+bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer& answer);
+
+}  // namespace cliphost

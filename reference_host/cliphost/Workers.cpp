@@ -1,0 +1,339 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/Workers.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cstdio>
+#include <deque>
+#include <map>
+#include <memory>
+#include <optional>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Fields.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/Words.h"
+#include "reference_host/system/ChildProcess.h"
+#include "reference_host/system/Confinement.h"
+#include "reference_host/system/DelayedSignals.h"
+#include "reference_host/system/ScratchFolder.h"
+
+namespace cliphost {
+namespace {
+
+using Clock = std::chrono::steady_clock;
+
+// Between what the process writes on standard error for one movie and for the next.
+constexpr char kEndOfMovie = '\0';
+constexpr std::size_t kMostTold = std::size_t{16} << 20;
+// Results that wait for one before them; more movies are not begun.
+constexpr std::size_t kMostWaiting = 256;
+constexpr char kNoAnswer[] = "the process that read it gave an answer that is none";
+constexpr std::size_t kMebibyte = std::size_t{1} << 20;
+
+struct Worker {
+    host::system::ChildProcess process;
+    std::filesystem::path folder;
+    MessageStream messages;
+    std::string errors;
+    bool isReady = false;
+    std::deque<std::size_t> requests;  // the first is being worked on
+    Clock::time_point since;
+};
+
+std::string EndInWords(const host::system::ProcessEnd& end) {
+    return end.signal != 0
+               ? fmt::format("the process that read it was ended by signal {}", end.signal)
+               : fmt::format("the process that read it ended with status {} and without an answer",
+                             end.status);
+}
+
+std::string TakeTold(Worker& worker) {
+    const std::size_t end = worker.errors.find(kEndOfMovie);
+    std::string told = worker.errors.substr(0, end);
+    worker.errors.erase(0, end == std::string::npos ? end : end + 1);
+    return told;
+}
+
+class Run {
+public:
+    Run(const WorkerCall& call, const std::vector<std::string>& requests, WorkerClient& client)
+        : call_(call), requests_(requests), client_(client) {
+        MakeScratchFolder();
+        const std::size_t most = std::min<std::size_t>(call.jobs, requests.size());
+        for (std::size_t i = 0; i < most; ++i) {
+            workers_.push_back(std::make_unique<Worker>());
+        }
+    }
+
+    void GoOn();
+
+private:
+    void MakeScratchFolder();
+    void HandOut();
+    void HandTo(Worker& worker, std::size_t request);
+    // False where the system has room for no more of them.
+    bool Start(Worker& worker);
+    std::optional<std::size_t> NextRequest();
+    void Wait();
+    void Listen(Worker& worker);
+    void Hear(Worker& worker, const std::string& message);
+    void HoldToLimits(Worker& worker);
+    // Ends the process; what it was at has failed, what it has not begun goes to another.
+    void Lose(Worker& worker, const std::string& why);
+    void Settle(Worker& worker, const std::string& failure);
+
+    const WorkerCall& call_;
+    const std::vector<std::string>& requests_;
+    WorkerClient& client_;
+    std::optional<host::system::ScratchFolder> scratch_;
+    std::size_t foldersMade_ = 0;
+    std::vector<std::unique_ptr<Worker>> workers_;
+    std::size_t next_ = 0;
+    std::deque<std::size_t> again_;
+    std::map<std::size_t, WorkerResult> waiting_;
+    std::size_t taken_ = 0;
+};
+
+void Run::MakeScratchFolder() {
+    if (call_.writeNear.empty()) {
+        return;
+    }
+    std::error_code error;
+    scratch_.emplace(call_.writeNear, error);
+    if (error) {
+        error.clear();
+        scratch_.emplace(error);
+    }
+    if (error) {
+        throw Failure(kExitCaller, std::filesystem::temp_directory_path(),
+                      "no folder can be made there: " + error.message(),
+                      "name another one in TMPDIR");
+    }
+}
+
+void Run::GoOn() {
+    while (taken_ < requests_.size()) {
+        HandOut();
+        Wait();
+        if (host::system::DelayedSignals::HaveCome()) {
+            return;  // it may have ended the processes, too
+        }
+        for (const auto& worker : workers_) {
+            Listen(*worker);
+        }
+        for (auto first = waiting_.find(taken_); first != waiting_.end();
+             first = waiting_.find(taken_)) {
+            client_.Take(first->first, first->second);
+            waiting_.erase(first);
+            ++taken_;
+        }
+    }
+}
+
+void Run::HandOut() {
+    // The next request lies ready where a process ends one, unless what it needs is measured.
+    const std::size_t most = call_.limits.mebibytes != 0 ? 1 : 2;
+    for (std::size_t depth = 1; depth <= most; ++depth) {
+        for (std::size_t i = 0; i < workers_.size(); ++i) {
+            Worker& worker = *workers_[i];
+            if (worker.requests.size() >= depth) {
+                continue;
+            }
+            const std::optional<std::size_t> request = NextRequest();
+            if (!request) {
+                return;
+            }
+            if (!worker.process.IsRunning() && !Start(worker)) {
+                again_.push_front(*request);
+                workers_.erase(workers_.begin() + static_cast<std::ptrdiff_t>(i));
+                return;  // the others have to do
+            }
+            HandTo(worker, *request);
+        }
+    }
+}
+
+void Run::HandTo(Worker& worker, std::size_t request) {
+    if (worker.requests.empty()) {
+        worker.since = Clock::now();
+    }
+    worker.requests.push_back(request);
+    // A process that takes nothing has ended; Listen finds that.
+    worker.process.Send(
+        FieldWriter().Add(std::uint64_t{request}).Add(requests_[request]).Message());
+}
+
+std::optional<std::size_t> Run::NextRequest() {
+    if (!again_.empty()) {
+        const std::size_t request = again_.front();
+        again_.pop_front();
+        return request;
+    }
+    if (next_ == requests_.size() || next_ - taken_ >= kMostWaiting) {
+        return std::nullopt;
+    }
+    client_.Begin(next_);
+    return next_++;
+}
+
+bool Run::Start(Worker& worker) {
+    worker.messages = {};
+    worker.errors.clear();
+    worker.isReady = false;
+    std::vector<std::string> arguments = call_.arguments;
+    if (scratch_) {
+        worker.folder = scratch_->path() / fmt::format("{}", foldersMade_++);
+        std::error_code error;
+        std::filesystem::create_directory(worker.folder, error);
+        arguments.push_back("--folder=" + worker.folder.native());
+    }
+    const int error = worker.process.Start(call_.program, arguments);
+    if (error != 0 && workers_.size() == 1) {
+        throw Failure(
+            kExitCaller, call_.program,
+            "no further process can be started: " + std::generic_category().message(error),
+            "try --jobs 1");
+    }
+    return error == 0;
+}
+
+void Run::Wait() {
+    std::vector<const host::system::ChildProcess*> running;
+    for (const auto& worker : workers_) {
+        if (worker->process.IsRunning()) {
+            running.push_back(&worker->process);
+        }
+    }
+    host::system::ChildProcess::WaitForAny(
+        running, std::chrono::milliseconds(call_.limits.AreSet() ? 20 : 200));
+}
+
+void Run::Listen(Worker& worker) {
+    if (!worker.process.IsRunning()) {
+        return;
+    }
+    const bool isOpen = worker.process.Receive(worker.messages.arrived());
+    worker.process.ReceiveErrors(worker.errors, kMostTold);
+    while (std::optional<std::string> message = worker.messages.Next()) {
+        Hear(worker, *message);
+        if (!worker.process.IsRunning()) {
+            return;
+        }
+    }
+    if (worker.messages.IsBroken()) {
+        Lose(worker, kNoAnswer);
+    } else if (!isOpen) {
+        Lose(worker, EndInWords(worker.process.End()));
+    } else {
+        HoldToLimits(worker);
+    }
+}
+
+void Run::Hear(Worker& worker, const std::string& message) {
+    if (!worker.isReady) {
+        worker.isReady = true;
+        worker.since = Clock::now();
+        TakeTold(worker);  // this process has told the same when it began
+        FieldReader fields(message);
+        const std::string missing = fields.Text();
+        if (!missing.empty() && call_.verbosity > 0) {
+            Notice("cliphost: a process that reads movies keeps rights that it does not need: {}\n",
+                   missing);
+        }
+        return;
+    }
+    if (worker.requests.empty()) {
+        worker.process.End();  // nobody asked
+        return;
+    }
+    const std::size_t most = call_.limits.mebibytes * kMebibyte;
+    const std::size_t needed = most != 0 ? worker.process.PeakMemory() : 0;
+    if (needed > most) {
+        HoldToLimits(worker);
+        return;
+    }
+    if (!client_.Read(worker.requests.front(), message)) {
+        Lose(worker, kNoAnswer);
+        return;
+    }
+    Settle(worker, "");
+    // What it holds would be laid to the movies after this one.
+    if (needed > most / 2) {
+        worker.process.End();
+    }
+}
+
+void Run::HoldToLimits(Worker& worker) {
+    const WorkerLimits& limits = call_.limits;
+    if (worker.requests.empty() || !worker.isReady) {
+        return;
+    }
+    if (limits.seconds != 0 && Clock::now() - worker.since > std::chrono::seconds(limits.seconds)) {
+        Lose(worker, fmt::format("took longer than {}", Counted(limits.seconds, "second")));
+    } else if (limits.mebibytes != 0 &&
+               worker.process.PeakMemory() > limits.mebibytes * kMebibyte) {
+        Lose(worker, fmt::format("needed more than {} MiB", limits.mebibytes));
+    }
+}
+
+void Run::Lose(Worker& worker, const std::string& why) {
+    worker.process.End();
+    if (!worker.isReady) {
+        Notice("{}", TakeTold(worker));
+        throw Failure(kExitCaller, call_.program, "a process that reads movies did not start",
+                      "try --jobs 1");
+    }
+    if (worker.requests.empty()) {
+        return;
+    }
+    Settle(worker, why);
+    again_.insert(again_.end(), worker.requests.begin(), worker.requests.end());
+    worker.requests.clear();
+}
+
+void Run::Settle(Worker& worker, const std::string& failure) {
+    waiting_.emplace(worker.requests.front(),
+                     WorkerResult{TakeTold(worker), failure, worker.folder});
+    worker.requests.pop_front();
+    worker.since = Clock::now();
+}
+
+}  // namespace
+
+void RunInWorkers(const WorkerCall& call, const std::vector<std::string>& requests,
+                  WorkerClient& client) {
+    // Takes effect once processes and folders are gone.
+    const host::system::DelayedSignals signals;
+    Run(call, requests, client).GoOn();
+}
+
+bool ServeAsWorker(const std::filesystem::path& folder,
+                   const std::function<std::string(std::uint64_t, const std::string&)>& answer) {
+    using host::system::ParentChannel;
+    if (!ParentChannel::Join()) {
+        return false;
+    }
+    const std::string missing = host::system::GiveUpRights(folder);
+    std::fputc(kEndOfMovie, stderr);
+    bool goesOn = ParentChannel::Write(FieldWriter().Add(missing).Message());
+    while (goesOn) {
+        std::string bytes(kLengthSize, '\0');
+        goesOn = ParentChannel::Read(bytes.data(), bytes.size());
+        const std::uint64_t length = goesOn ? LengthIn(bytes) : 0;
+        bytes.assign(std::min(length, kLongestMessage), '\0');
+        goesOn = goesOn && ParentChannel::Read(bytes.data(), bytes.size());
+        if (goesOn) {
+            FieldReader fields(bytes);
+            const std::uint64_t number = fields.Number();
+            const std::string answered = answer(number, fields.Text());
+            std::fputc(kEndOfMovie, stderr);
+            goesOn = ParentChannel::Write(FieldWriter().Add(answered).bytes());
+        }
+    }
+    return true;
+}
+
+}  // namespace cliphost

@@ -1,0 +1,312 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// `describe --jobs`: the same results as from one process, and what a movie does to the process
+// that reads it costs that movie alone.
+
+#include <signal.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <nlohmann/json.hpp>
+#include <thread>
+
+#include "tests/system/Command.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using Json = nlohmann::ordered_json;
+using namespace std::chrono_literals;
+
+std::string Program() {
+    return Quoted(ProgramFolder() / "cliphost");
+}
+
+// Standard output alone.
+CommandResult RunQuietly(const std::string& arguments) {
+    return RunCommand(Program() + " " + arguments + " 2>/dev/null");
+}
+
+std::size_t CountOf(const std::string& text, const std::string& words) {
+    std::size_t count = 0;
+    for (auto at = text.find(words); at != std::string::npos; at = text.find(words, at + 1)) {
+        ++count;
+    }
+    return count;
+}
+
+std::set<std::string> NamesIn(const std::filesystem::path& folder) {
+    std::set<std::string> names;
+    for (const auto& entry : std::filesystem::directory_iterator(folder)) {
+        names.insert(entry.path().filename());
+    }
+    return names;
+}
+
+class Jobs : public SystemTest {
+protected:
+    void SetUp() override {
+        SystemTest::SetUp();
+        std::filesystem::create_directories(folder() / "in");
+        std::filesystem::create_directories(folder() / "tmp");
+    }
+    std::string In(const std::string& name) { return Quoted(folder() / name); }
+    void Copy(const std::string& name) {
+        std::filesystem::copy_file(MadeMovie("png.mov"), folder() / "in" / name);
+    }
+    // A call whose module does harm for movies of certain names, and whose temporary files
+    // have a folder of their own.
+    CommandResult Harmed(const std::string& arguments) {
+        return RunCommand("TMPDIR=" + In("tmp") + " " + Program() + " --plugin " +
+                          Quoted(ProgramFolder() / "tests" / "BreakingModule.nvx") + " " +
+                          arguments + " 2>&1");
+    }
+    std::string Line(const std::string& name, const std::string& words) {
+        return "cliphost: " + (folder() / "in" / name).string() + ": " + words + "\n";
+    }
+};
+
+constexpr char kPinned[] = " --pin-time 2026-01-31T12:00:00Z ";
+
+// Movies of all kinds, files that are none, and a path that is not there.
+class EqualJobs : public Jobs {
+protected:
+    void SetUp() override {
+        Jobs::SetUp();
+        Write(movies::Bytes(100, 'x'), "in/text.mov");
+        Write(movies::Bytes{}, "in/empty.mov");
+        Write(movies::Bytes{}, "in/other.mp4");
+        Copy("a\xFF.mov");
+        Copy("back\\slash.mov");
+        paths_ = Quoted(MadeMoviesFolder()) + " " + In("in") + " " + In("absent.mov") + " " +
+                 Quoted(MadeMovie("png.mov")) + " " + Quoted(MadeMovie("aac.mov"));
+    }
+    std::string paths_;
+};
+
+TEST_F(EqualJobs, PrintTheSame) {
+    for (const char* const form : {"", "--json", "-q"}) {
+        SCOPED_TRACE(form);
+        const std::string call = std::string("-v describe ") + form + kPinned + paths_;
+        const CommandResult one = RunQuietly(call + " --jobs 1");
+        EXPECT_EQ(one.status, 2);
+        EXPECT_GT(one.out.size(), 1000u);
+        const CommandResult oneTold =
+            RunCommand(Program() + " " + call + " --jobs 1 2>&1 >/dev/null");
+        EXPECT_GT(CountOf(oneTold.out, "cliphost: "), 4u);
+        for (const char* const jobs :
+             {" --jobs 2", " --jobs 5", "", " --jobs 1 --limit-seconds 100"}) {
+            const CommandResult several = RunQuietly(call + jobs);
+            EXPECT_EQ(several.status, one.status) << jobs;
+            EXPECT_TRUE(several.out == one.out) << jobs;
+            const CommandResult told =
+                RunCommand(Program() + " " + call + jobs + " 2>&1 >/dev/null");
+            EXPECT_EQ(told.out, oneTold.out) << jobs;
+        }
+    }
+}
+
+TEST_F(EqualJobs, SaveTheSame) {
+    std::set<std::string> names;
+    std::string printed;
+    for (const char* const jobs : {"1", "2", "5"}) {
+        SCOPED_TRACE(jobs);
+        const auto out = folder() / "out";
+        const CommandResult ran =
+            RunCommand("TMPDIR=" + In("tmp") + " " + Program() + " describe --json" + kPinned +
+                       paths_ + " --jobs " + jobs + " --out-dir " + Quoted(out) + " 2>/dev/null");
+        EXPECT_EQ(ran.status, 2);
+        if (names.empty()) {
+            names = NamesIn(out);
+            printed = ran.out;
+            EXPECT_EQ(names.count("png-2.aaf"), 1u);
+            std::filesystem::rename(out, folder() / "first");
+            continue;
+        }
+        EXPECT_TRUE(ran.out == printed);
+        EXPECT_EQ(NamesIn(out), names);
+        for (const std::string& name : names) {
+            EXPECT_EQ(ReadFile(out / name), ReadFile(folder() / "first" / name)) << name;
+        }
+        EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+        std::filesystem::remove_all(out);
+    }
+}
+
+TEST_F(Jobs, SaveOneMovieWhereverItIsWanted) {
+    const std::string movie = Quoted(MadeMovie("png.mov"));
+    const std::string call = "describe -q" + std::string(kPinned) + movie + " --aaf ";
+    ASSERT_EQ(RunCliphost(call + In("here.aaf")).status, 0);
+    ASSERT_EQ(RunCliphost(call + In("limited.aaf") + " --limit-seconds 100").status, 0);
+    EXPECT_EQ(ReadFile(folder() / "limited.aaf"), ReadFile(folder() / "here.aaf"));
+    const CommandResult piped =
+        RunCommand(Program() + " " + call + "- --limit-seconds 100 > " + In("piped.aaf"));
+    EXPECT_EQ(piped.status, 0);
+    EXPECT_EQ(ReadFile(folder() / "piped.aaf"), ReadFile(folder() / "here.aaf"));
+}
+
+TEST_F(Jobs, TellWhatCantBeWrittenByTheUsersName) {
+    Copy("a.mov");
+    Copy("b.mov");
+    std::filesystem::create_directories(folder() / "out" / "a.aaf");
+    const std::string call = "describe -q " + In("in") + " --out-dir " + In("out") + " --jobs ";
+    const CommandResult one = RunCliphost(call + "1");
+    ExpectSays(one, 2, (folder() / "out" / "a.aaf").string());
+    EXPECT_EQ(RunCliphost(call + "2").out, one.out);
+    EXPECT_EQ(NamesIn(folder() / "out"), (std::set<std::string>{"a.aaf", "b.aaf"}));
+}
+
+TEST_F(Jobs, LoseOneMovieToACrash) {
+    for (const char* const name : {"a.mov", "b.mov", "crash.mov", "d.mov", "leave.mov", "z.mov"}) {
+        Copy(name);
+    }
+    for (const char* const jobs : {"2", "5"}) {
+        const CommandResult ran = Harmed("describe -q " + In("in") + " --jobs " + jobs);
+        ExpectSays(ran, 1, Line("crash.mov", "the process that read it was ended by signal 11"));
+        ExpectSays(ran, 1,
+                   Line("leave.mov",
+                        "the process that read it ended with status 3 and without an answer"));
+        ExpectSays(ran, 1, "4 described, 2 not");
+    }
+    const CommandResult json =
+        Harmed("describe --json --jobs 2 " + In("in") + " --out-dir " + In("out"));
+    const Json list = Json::parse(json.out.substr(json.out.find('[')));
+    ASSERT_EQ(list.size(), 6u);
+    EXPECT_EQ(list[2]["reason"], "the process that read it was ended by signal 11");
+    EXPECT_EQ(list[2].count("description"), 0u);
+    EXPECT_EQ(list[3]["description"]["class"], list[0]["description"]["class"]);
+    EXPECT_EQ(NamesIn(folder() / "out"),
+              (std::set<std::string>{"a.aaf", "b.aaf", "d.aaf", "z.aaf"}));
+    EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+}
+
+TEST_F(Jobs, LoseOneMovieToItsTimeOrMemory) {
+    for (const char* const name : {"a.mov", "hang.mov", "hog.mov", "z.mov"}) {
+        Copy(name);
+    }
+    const CommandResult ran =
+        Harmed("describe -q " + In("in") + " --jobs 2 --limit-seconds 4 --limit-memory 700");
+    ExpectSays(ran, 1, Line("hang.mov", "took longer than 4 seconds"));
+    ExpectSays(ran, 1, Line("hog.mov", "needed more than 700 MiB"));
+    ExpectSays(ran, 1, "2 described, 2 not");
+}
+
+TEST_F(Jobs, ProtectASingleMovieWhereALimitIsGiven) {
+    Copy("crash.mov");
+    ExpectSays(Harmed("describe " + In("in/crash.mov") + " --limit-seconds 100"), 1,
+               Line("crash.mov", "the process that read it was ended by signal 11"));
+}
+
+TEST_F(Jobs, TakeNoAnswerThatIsNone) {
+    for (const char* const name : {"a.mov", "length.mov", "z.mov"}) {
+        Copy(name);
+    }
+    ExpectSays(Harmed("describe -q --jobs 2 " + In("in")), 1,
+               Line("length.mov", "the process that read it gave an answer that is none"));
+    std::filesystem::rename(folder() / "in/length.mov", folder() / "in/nonsense.mov");
+    const CommandResult ran = Harmed("describe -q --jobs 2 --limit-seconds 4 " + In("in"));
+    ExpectSays(ran, 1,
+               Line("nonsense.mov", "the process that read it gave an answer that is none"));
+    ExpectSays(ran, 1, "2 described, 1 not");
+}
+
+TEST_F(Jobs, EscapeWhatAProcessWrites) {
+    Copy("a.mov");
+    Copy("controls.mov");
+    ExpectSays(Harmed("describe -q --jobs 2 " + In("in")), 0, "\\x1B[2Jcleared");
+}
+
+TEST_F(Jobs, GiveUpWhatReadingDoesNotNeed) {
+    Copy("a.mov");
+    Copy("probe.mov");
+    const CommandResult ran = Harmed("describe -q --jobs 2 " + In("in"));
+    for (const char* const what :
+         {"socket", "process", "signal", "new code", "rights of a file", "writing the movie",
+          "a file beside it", "removing the movie", "program"}) {
+        ExpectSays(ran, 0, std::string(what) + ": refused\n");
+    }
+    ExpectSays(ran, 0, "thread: done\n");
+    ExpectSays(ran, 0, "reading: done\n");
+}
+
+TEST_F(Jobs, WriteNothingButTheirOwnFolder) {
+    Copy("a.mov");
+    Copy("probe.mov");
+    const CommandResult ran =
+        Harmed("-v describe -q --jobs 2 " + In("in") + " --out-dir " + In("out"));
+    if (ran.out.find("Landlock") != std::string::npos) {
+        GTEST_SKIP() << "the system has no Landlock";
+    }
+    for (const char* const what : {"socket", "process", "program", "writing the movie",
+                                   "a file beside it", "removing the movie"}) {
+        ExpectSays(ran, 0, std::string(what) + ": refused\n");
+    }
+    EXPECT_EQ(NamesIn(folder() / "in"), (std::set<std::string>{"a.mov", "probe.mov"}));
+}
+
+// Processes with these words in their command line.
+std::set<std::string> ProcessesOf(const std::string& words) {
+    std::set<std::string> found;
+    for (const auto& entry : std::filesystem::directory_iterator("/proc")) {
+        std::error_code ignored;
+        if (!std::filesystem::exists(entry.path() / "cmdline", ignored)) {
+            continue;
+        }
+        const movies::Bytes line = ReadFile(entry.path() / "cmdline");
+        if (std::string(line.begin(), line.end()).find(words) != std::string::npos) {
+            found.insert(entry.path().filename());
+        }
+    }
+    return found;
+}
+
+TEST_F(Jobs, EndWithTheProgram) {
+    Copy("hang.mov");
+    Copy("hang-not.mov");
+    const std::string mark = "--plugin=" + (ProgramFolder() / "tests/BreakingModule.nvx").string();
+    for (const int signal : {SIGINT, SIGTERM, SIGKILL}) {
+        SCOPED_TRACE(signal);
+        const pid_t program = fork();
+        ASSERT_GE(program, 0);
+        if (program == 0) {
+            setenv("TMPDIR", (folder() / "tmp").c_str(), 1);
+            execl((ProgramFolder() / "cliphost").c_str(), "cliphost", mark.c_str(), "describe",
+                  "-q", "--jobs", "2", (folder() / "in").c_str(), "--out-dir",
+                  (folder() / "out").c_str(), nullptr);
+            _exit(127);
+        }
+        // The first movie is saved, the second one hangs.
+        const auto saved = folder() / "out" / "hang-not.aaf";
+        for (int i = 0; i < 1000 && !std::filesystem::exists(saved); ++i) {
+            std::this_thread::sleep_for(20ms);
+        }
+        EXPECT_EQ(ProcessesOf(folder().string()).size(), 3u);  // each names the folder
+        ASSERT_EQ(kill(program, signal), 0);
+        int status = 0;
+        ASSERT_EQ(waitpid(program, &status, 0), program);
+        EXPECT_TRUE(WIFSIGNALED(status));
+        EXPECT_EQ(WTERMSIG(status), signal);
+        for (int i = 0; i < 100 && !ProcessesOf(folder().string()).empty(); ++i) {
+            std::this_thread::sleep_for(20ms);
+        }
+        EXPECT_TRUE(ProcessesOf(folder().string()).empty());
+        if (signal != SIGKILL) {
+            EXPECT_EQ(NamesIn(folder() / "out"), std::set<std::string>{"hang-not.aaf"});
+        }
+        std::filesystem::remove_all(folder() / "out");
+    }
+}
+
+TEST_F(Jobs, RefuseOddNumbers) {
+    for (const char* const option :
+         {"--jobs 0", "--jobs x", "--jobs 1.5", "--limit-seconds 0", "--limit-memory 10"}) {
+        ExpectSays(RunCliphost("describe a.mov " + std::string(option)), 2,
+                   "is not a whole number");
+    }
+    ExpectSays(RunCliphost("describe-for-parent"), 2, "use `cliphost describe`");
+    EXPECT_EQ(RunCliphost("--help").out.find("describe-for-parent"), std::string::npos);
+}
+
+}  // namespace

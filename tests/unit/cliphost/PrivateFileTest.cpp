@@ -1,0 +1,73 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/PrivateFile.h"
+
+#include <gtest/gtest.h>
+
+#include <fstream>
+
+#include "reference_host/cliphost/Failure.h"
+#include "tests/support/TestFolder.h"
+
+namespace {
+
+using namespace cliphost;
+
+class PrivateFiles : public testing::Test {
+protected:
+    std::filesystem::path Write(const std::string& name, const std::string& text) {
+        std::ofstream(folder_.path() / name) << text;
+        return folder_.path() / name;
+    }
+    static std::string Read(const std::filesystem::path& file) {
+        std::ifstream stream(file);
+        return {std::istreambuf_iterator<char>(stream), {}};
+    }
+    std::filesystem::path folder() const { return folder_.path(); }
+
+private:
+    const TestFolder folder_;
+};
+
+TEST_F(PrivateFiles, TakeTheirPlace) {
+    const auto file = Write("0.aaf", "new");
+    const auto place = Write("place", "old");
+    PutIntoPlace(file, place);
+    EXPECT_EQ(Read(place), "new");
+    EXPECT_FALSE(std::filesystem::exists(file));
+}
+
+TEST_F(PrivateFiles, StayBehindALinkOfTheUsers) {
+    const auto file = Write("0.aaf", "new");
+    const auto target = Write("target", "old");
+    std::filesystem::create_symlink("target", folder() / "place");
+    PutIntoPlace(file, folder() / "place");
+    EXPECT_TRUE(std::filesystem::is_symlink(folder() / "place"));
+    EXPECT_EQ(Read(target), "new");
+}
+
+TEST_F(PrivateFiles, AreFilesOfTheirOwn) {
+    const auto secret = Write("secret", "text");
+    const auto place = Write("place", "old");
+    std::filesystem::create_symlink(secret, folder() / "link");
+    std::filesystem::create_hard_link(secret, folder() / "second name");
+    std::filesystem::create_directory(folder() / "folder");
+    for (const char* const name : {"link", "second name", "folder", "absent"}) {
+        EXPECT_THROW(PutIntoPlace(folder() / name, place), Failure) << name;
+        EXPECT_EQ(Read(place), "old") << name;
+    }
+    EXPECT_EQ(Read(secret), "text");
+}
+
+TEST_F(PrivateFiles, AreCopiedFromAnotherFileSystem) {
+    const std::filesystem::path memory = "/dev/shm/cliphost-private-file-test";
+    std::ofstream(memory) << "new";
+    if (!std::filesystem::exists(memory)) {
+        GTEST_SKIP() << "no other file system to write to";
+    }
+    PutIntoPlace(memory, folder() / "place");
+    EXPECT_EQ(Read(folder() / "place"), "new");
+    EXPECT_FALSE(std::filesystem::exists(memory));
+}
+
+}  // namespace

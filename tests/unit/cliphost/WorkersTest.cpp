@@ -1,0 +1,197 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// Processes that answer, and such that do anything else. A shell stands in for the program:
+// descriptor 3 is its channel.
+
+#include "reference_host/cliphost/Workers.h"
+
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+
+#include <map>
+#include <vector>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Fields.h"
+
+namespace {
+
+using namespace cliphost;
+
+// Bytes as the shell's printf takes them.
+std::string Octal(const std::string& bytes) {
+    std::string text;
+    for (const char c : bytes) {
+        const auto value = static_cast<unsigned char>(c);
+        text += {'\\', '0', static_cast<char>('0' + (value >> 6)),
+                 static_cast<char>('0' + (value >> 3 & 7)), static_cast<char>('0' + (value & 7))};
+    }
+    return "printf %b '" + text + "' >&3\n";
+}
+
+std::string Ready() {
+    return Octal(FieldWriter().Add("").Message());
+}
+
+std::string Answer(const std::string& text) {
+    return Octal(FieldWriter().Add(text).Message());
+}
+
+// Waits for the next request: 8 bytes of length, 8 of number, 8 of length and the text "x".
+std::string Request() {
+    return "head -c 25 <&3 >/dev/null || exit\n";
+}
+
+class Client : public WorkerClient {
+public:
+    void Begin(std::size_t number) override { begun.push_back(number); }
+    bool Read(std::size_t number, const std::string& answer) override {
+        FieldReader fields(answer);
+        answers[number] = fields.Text();
+        return fields.IsWhole();
+    }
+    void Take(std::size_t number, const WorkerResult& result) override {
+        taken.push_back(number);
+        results.push_back(result);
+    }
+
+    std::vector<std::size_t> begun;
+    std::map<std::size_t, std::string> answers;
+    std::vector<std::size_t> taken;
+    std::vector<WorkerResult> results;
+};
+
+// Gives so many requests to so many shells.
+Client RunShells(const std::string& script, std::size_t requests = 1, unsigned jobs = 1,
+                 const WorkerLimits& limits = {}) {
+    WorkerCall call;
+    call.program = "/bin/sh";
+    call.arguments = {"-c", script};
+    call.jobs = jobs;
+    call.limits = limits;
+    Client client;
+    RunInWorkers(call, std::vector<std::string>(requests, "x"), client);
+    return client;
+}
+
+std::string FailureOf(const std::string& afterRequest, const WorkerLimits& limits = {}) {
+    const Client client = RunShells(Ready() + Request() + afterRequest, 1, 1, limits);
+    return client.results.size() == 1 ? client.results[0].failure : "no result";
+}
+
+TEST(Workers, GiveResultsInTheOrderOfTheRequests) {
+    const std::string loop = Ready() + "while true\ndo\n" + Request() + Answer("fine") + "done\n";
+    for (const unsigned jobs : {1u, 2u, 5u, 20u}) {
+        const Client client = RunShells(loop, 12, jobs);
+        ASSERT_EQ(client.taken.size(), 12u) << jobs;
+        for (std::size_t i = 0; i < 12; ++i) {
+            EXPECT_EQ(client.taken[i], i);
+            EXPECT_EQ(client.begun[i], i);
+            EXPECT_EQ(client.answers.at(i), "fine");
+            EXPECT_EQ(client.results[i].failure, "");
+        }
+    }
+}
+
+TEST(Workers, TellHowAProcessEnded) {
+    EXPECT_EQ(FailureOf("kill -SEGV $$"), "the process that read it was ended by signal 11");
+    EXPECT_EQ(FailureOf("exit 7"),
+              "the process that read it ended with status 7 and without an answer");
+    EXPECT_EQ(FailureOf("exit 0"),
+              "the process that read it ended with status 0 and without an answer");
+    // It would stay without anything to say.
+    EXPECT_EQ(FailureOf("exec 3>&-; sleep 1000"), "the process that read it was ended by signal 9");
+}
+
+TEST(Workers, KeepWhatAProcessWroteBeforeItEnded) {
+    const Client client = RunShells(Ready() + Request() + "echo half a line >&2; kill -SEGV $$");
+    ASSERT_EQ(client.results.size(), 1u);
+    EXPECT_EQ(client.results[0].told, "half a line\n");
+}
+
+TEST(Workers, EndAProcessThatGivesNoAnswer) {
+    const std::string none = "the process that read it gave an answer that is none";
+    EXPECT_EQ(FailureOf(Octal(FieldWriter().Add(~std::uint64_t{0}).bytes()) + "sleep 1000"), none);
+    EXPECT_EQ(FailureOf(Octal(FieldWriter().Add(kLongestMessage + 1).bytes()) + "sleep 1000"),
+              none);
+    EXPECT_EQ(FailureOf(Octal(FieldWriter().Message()) + "sleep 1000"), none);
+    EXPECT_EQ(FailureOf(Octal(FieldWriter().Add("a").Add("b").Message()) + "sleep 1000"), none);
+}
+
+TEST(Workers, TakeTheRestFromAnotherProcess) {
+    // Each process answers one request and ends at the second one.
+    const Client client =
+        RunShells(Ready() + Request() + Answer("fine") + Request() + "kill -SEGV $$", 6, 2);
+    ASSERT_EQ(client.results.size(), 6u);
+    std::size_t lost = 0;
+    for (const WorkerResult& result : client.results) {
+        lost += result.failure.empty() ? 0 : 1;
+    }
+    EXPECT_GE(lost, 2u);
+    EXPECT_LE(lost, 3u);
+    EXPECT_EQ(client.answers.size() + lost, 6u);
+}
+
+TEST(Workers, HeedNoAnswerThatNobodyAskedFor) {
+    const Client client = RunShells(
+        Ready() + Request() + Answer("one") + Answer("two") + Answer("three") + "sleep 1000", 1);
+    ASSERT_EQ(client.results.size(), 1u);
+    EXPECT_EQ(client.answers.at(0), "one");
+}
+
+TEST(Workers, EndAProcessThatTakesTooLong) {
+    EXPECT_EQ(FailureOf("sleep 1000", {1, 0}), "took longer than 1 second");
+    EXPECT_EQ(FailureOf("while true; do :; done", {2, 0}), "took longer than 2 seconds");
+}
+
+TEST(Workers, EndAProcessThatNeedsTooMuch) {
+    EXPECT_EQ(FailureOf("x=xxxxxxxxxxxxxxxx; while true; do x=$x$x; done", {0, 64}),
+              "needed more than 64 MiB");
+}
+
+TEST(Workers, FailWhereNoProcessStarts) {
+    EXPECT_THROW(RunShells("exit 1"), Failure);
+    WorkerCall call;
+    call.program = "/no/such/program";
+    Client client;
+    EXPECT_THROW(RunInWorkers(call, {"x"}, client), Failure);
+}
+
+TEST(Workers, AreAsManyAsTheSystemHasRoomFor) {
+    rlimit before{};
+    ASSERT_EQ(getrlimit(RLIMIT_NOFILE, &before), 0);
+    const rlimit few{40, before.rlim_max};
+    ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &few), 0);
+    const Client client =
+        RunShells(Ready() + "while true\ndo\n" + Request() + Answer("fine") + "done\n", 100, 100);
+    ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &before), 0);
+    EXPECT_EQ(client.answers.size(), 100u);
+}
+
+TEST(Workers, HaveNothingToDoWithoutRequests) {
+    EXPECT_TRUE(RunShells("exit 1", 0).taken.empty());
+}
+
+TEST(Workers, GetAFolderEach) {
+    WorkerCall call;
+    call.program = "/bin/sh";
+    call.arguments = {"-c", Ready() + Request() + "echo \"$0\" >&2; test -d \"${0#*=}\" && " +
+                                Answer("there") + "sleep 1000"};
+    call.jobs = 1;
+    call.writeNear = testing::TempDir();
+    Client client;
+    RunInWorkers(call, {"x"}, client);
+    ASSERT_EQ(client.results.size(), 1u);
+    EXPECT_EQ(client.results[0].failure, "");
+    const std::filesystem::path folder = client.results[0].folder;
+    EXPECT_EQ(folder.parent_path().parent_path(),
+              std::filesystem::path(testing::TempDir() + "/").lexically_normal().parent_path());
+    EXPECT_FALSE(std::filesystem::exists(folder.parent_path()));
+}
+
+TEST(Workers, AreStartedByAParent) {
+    EXPECT_FALSE(ServeAsWorker({}, [](std::uint64_t, const std::string&) { return ""; }));
+}
+
+}  // namespace
