@@ -20,6 +20,17 @@ if(CCACHE)
   set(CMAKE_CXX_COMPILER_LAUNCHER ${CCACHE})
 endif()
 
+# A linker that takes a tenth of the time, where there is one.
+find_program(LLD ld.lld)
+if(LLD AND NOT WIN32)
+  add_link_options(-fuse-ld=lld)
+endif()
+
+# The files are small and read the same headers. In batches, the first build of all
+# takes a third of the time; file by file, the next build after an edit is the shorter.
+option(CLIPHOST_BATCHES "Compile the files of a library in batches" OFF)
+set(CMAKE_UNITY_BUILD_BATCH_SIZE 8)
+
 add_library(project_options INTERFACE)
 target_include_directories(project_options INTERFACE ${PROJECT_SOURCE_DIR})
 target_compile_options(project_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wvla
@@ -46,8 +57,26 @@ endfunction()
 function(project_library name)
   cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
   add_library(${name} STATIC ${ARG_SOURCES})
+  set_target_properties(${name} PROPERTIES UNITY_BUILD ${CLIPHOST_BATCHES})
   target_link_libraries(${name} PUBLIC project_options host_interfaces ${ARG_PUBLIC}
                                 PRIVATE ${ARG_PRIVATE})
+endfunction()
+
+# The headers of the test framework take longer to read than most tests: where files are compiled in
+# batches, they are read once for all tests. The tests' own code is compiled without optimisation
+# there, which halves its time; what is tested keeps it.
+function(test_code name)
+  target_link_libraries(${name} PRIVATE project_options GTest::gtest GTest::gmock)
+  if(NOT CLIPHOST_BATCHES)
+    return()
+  endif()
+  target_compile_options(${name} PRIVATE -O0 -fpch-preprocess)
+  if(name STREQUAL test_headers)
+    target_precompile_headers(${name} PRIVATE <gmock/gmock.h> <gtest/gtest.h> <algorithm>
+      <filesystem> <fstream> <functional> <map> <memory> <string> <vector>)
+  else()
+    target_precompile_headers(${name} REUSE_FROM test_headers)
+  endif()
 endfunction()
 
 # project_test(NAME SOURCES file... LIBS target... [LABELS label...])
@@ -55,8 +84,8 @@ endfunction()
 function(project_test name)
   cmake_parse_arguments(ARG "" "" "SOURCES;LIBS;LABELS" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
-  target_link_libraries(${name} PRIVATE project_options ${ARG_LIBS} GTest::gtest GTest::gmock
-                                        GTest::gtest_main)
+  test_code(${name})
+  target_link_libraries(${name} PRIVATE ${ARG_LIBS} GTest::gtest_main)
   set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR}/tests)
   gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60
                        PROPERTIES TIMEOUT 300 LABELS "${ARG_LABELS}")

@@ -10,7 +10,7 @@ namespace aaf {
 
 namespace {
 
-const ClassEntry kClasses[] = {
+const ClassEntry kDefinitionClasses[] = {
     {AUID_AAFInterchangeObject, &CreateAs<Object>},
     {AUID_AAFDictionary, &CreateAs<Dictionary>},
     {AUID_AAFDefinitionObject, &CreateAs<DefinitionObject>},
@@ -28,7 +28,7 @@ const ClassEntry kClasses[] = {
 }  // namespace
 
 ClassRegistry::ClassRegistry() {
-    Add(kClasses);
+    Add(kDefinitionClasses);
 }
 
 ObjectCreator ClassRegistry::Find(const GUID& classId) const {

@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <cstring>
 
+#include "aaf_library/model/StoredNumbers.h"
+
 // An opaque value is stored as one byte that tells the byte order, sixteen of
 // the key, and then the bytes themselves.
 
@@ -12,7 +14,6 @@ namespace aaf {
 
 namespace {
 
-constexpr std::uint8_t kLittleEndian = 0x4C;
 constexpr std::size_t kKeyAt = 1;
 constexpr std::size_t kBytesAt = kKeyAt + sizeof(aafUID_t);
 
@@ -31,7 +32,7 @@ HRESULT KLVData::Initialize(aafUID_t key, aafUInt32 length, aafDataBuffer_t valu
         return AAFRESULT_ALREADY_INITIALIZED;
     }
     Bytes bytes(kBytesAt + length);
-    bytes[0] = kLittleEndian;
+    bytes[0] = kLittleEndianMark;
     std::memcpy(&bytes[kKeyAt], &key, sizeof key);
     std::copy_n(value, length, bytes.begin() + kBytesAt);
     RequireValue(prop::KLVData_Value)->BytesToChange() = std::move(bytes);

@@ -36,7 +36,7 @@ namespace {
 
 // Abstract classes stand here too: the classes that another program derived
 // from them are made with them.
-const ClassEntry kClasses[] = {
+const ClassEntry kObjectClasses[] = {
     {AUID_AAFFiller, &CreateAs<Filler>},
     {AUID_AAFSequence, &CreateAs<Sequence>},
     {AUID_AAFSourceReference, &CreateAs<SourceReference>},
@@ -111,7 +111,7 @@ const ClassEntry kClasses[] = {
 const ClassRegistry& ObjectClasses() {
     static const ClassRegistry registry = [] {
         ClassRegistry made;
-        made.Add(kClasses);
+        made.Add(kObjectClasses);
         return made;
     }();
     return registry;

@@ -9,7 +9,7 @@ namespace {
 
 using namespace format;
 
-constexpr ImageLayout kLayouts[] = {
+constexpr ImageLayout kImageLayouts[] = {
     {"2vuy", kCbYCrY, kBytes, 0, PictureBytes::CbYCrY8, 2, 8, "8-bit Y'CbCr 4:2:2, bytes Cb Y Cr Y",
      "uyvy422"},
     {"v210", kCbYCrY, kV210, 0, PictureBytes::Unusable, 4, 10,
@@ -58,7 +58,7 @@ int BitsOf(const ImageFormat& format) {
 }  // namespace
 
 const ImageLayout* LayoutOf(const ImageFormat& format) {
-    for (const ImageLayout& layout : kLayouts) {
+    for (const ImageLayout& layout : kImageLayouts) {
         if (layout.pixels == format.pixels && layout.component == format.component &&
             (layout.range == 0 || layout.range == format.range)) {
             return &layout;

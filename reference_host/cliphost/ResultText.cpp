@@ -8,13 +8,13 @@
 namespace cliphost {
 namespace {
 
-struct Row {
+struct NamedResult {
     NCFRESULT code;
     const char* name;
     const char* sentence;
 };
 
-constexpr Row kRows[] = {
+constexpr NamedResult kNamedResults[] = {
     {NCF_OK, "NCF_OK", "success"},
     {NCF_E_NOTIMPL, "NCF_E_NOTIMPL", "the component does not do this"},
     {NCF_E_OUTOFMEMORY, "NCF_E_OUTOFMEMORY", "memory ran out"},
@@ -43,8 +43,8 @@ constexpr Row kRows[] = {
     {NMA_E_NODATA, "NMA_E_NODATA", "there is no data"},
 };
 
-const Row* Find(NCFRESULT result) {
-    for (const Row& row : kRows) {
+const NamedResult* Find(NCFRESULT result) {
+    for (const NamedResult& row : kNamedResults) {
         if (row.code == result) {
             return &row;
         }
@@ -55,13 +55,13 @@ const Row* Find(NCFRESULT result) {
 }  // namespace
 
 std::string ResultName(NCFRESULT result) {
-    const Row* const row = Find(result);
+    const NamedResult* const row = Find(result);
     return row ? row->name : fmt::format("0x{:08X}", static_cast<ncfUInt32>(result));
 }
 
 std::string ResultText(NCFRESULT result) {
     const auto number = static_cast<ncfUInt32>(result);
-    if (const Row* const row = Find(result)) {
+    if (const NamedResult* const row = Find(result)) {
         return fmt::format("{} (0x{:08X}): {}", row->name, number, row->sentence);
     }
     if ((number & 0xFFFF0000u) == 0x80120000u) {

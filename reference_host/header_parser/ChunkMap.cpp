@@ -5,16 +5,15 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <limits>
 
 #include "reference_host/header_parser/Marks.h"
+#include "reference_host/header_parser/NumberLimits.h"
 
 namespace header_parser {
 
 namespace {
 
 constexpr ncfUInt32 kStep = 16;
-constexpr ncfUInt64 kMaxPosition = static_cast<ncfUInt64>(std::numeric_limits<ncfSInt64>::max());
 
 unsigned LowestBit(ncfUInt64 bits) {
     unsigned place = 0;

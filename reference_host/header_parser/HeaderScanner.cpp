@@ -6,15 +6,13 @@
 
 #include <algorithm>
 #include <iterator>
-#include <limits>
 
 #include "reference_host/header_parser/Atom.h"
+#include "reference_host/header_parser/NumberLimits.h"
 
 namespace header_parser {
 
 namespace {
-
-constexpr ncfUInt64 kMaxPosition = static_cast<ncfUInt64>(std::numeric_limits<ncfSInt64>::max());
 
 // A multiple of what any disk reads at once.
 constexpr ncfUInt64 kSector = 4096;

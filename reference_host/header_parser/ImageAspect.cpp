@@ -4,14 +4,12 @@
 
 #include <algorithm>
 #include <cmath>
-#include <limits>
 #include <numeric>
+#include "reference_host/header_parser/NumberLimits.h"
 
 namespace header_parser {
 
 namespace {
-
-constexpr ncfUInt64 kMax32 = std::numeric_limits<ncfUInt32>::max();
 
 // (a * b * c) / (d * e * f), reduced. False when that needs more than 32 bits.
 bool Reduce(ncfUInt64 (&above)[3], ncfUInt64 (&below)[3], Ratio& ratio) {

@@ -6,12 +6,11 @@
 
 #include <algorithm>
 #include <limits>
+#include "reference_host/header_parser/NumberLimits.h"
 
 namespace header_parser {
 
 namespace {
-
-constexpr ncfUInt64 kMax32 = std::numeric_limits<ncfUInt32>::max();
 
 struct MovieHeader {
     Atom atom;  // none before it is read

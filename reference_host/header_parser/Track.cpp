@@ -6,6 +6,7 @@
 #include <limits>
 
 #include "reference_host/header_parser/Movie.h"
+#include "reference_host/header_parser/NumberLimits.h"
 
 // One function for each atom of a track:
 //
@@ -18,8 +19,6 @@
 namespace header_parser {
 
 namespace {
-
-constexpr ncfUInt64 kMax32 = std::numeric_limits<ncfUInt32>::max();
 
 struct TrackAtoms {
     Atom tkhd, elst, mdhd, hdlr, vmhd, smhd, dref, stsd;

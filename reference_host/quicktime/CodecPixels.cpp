@@ -23,7 +23,7 @@ constexpr auto kArgb16 = static_cast<ncfUInt32>(PixelLayout::Argb16);
 constexpr auto kFloat = static_cast<ncfUInt32>(PixelLayout::AyuvFloat);
 
 // Packets looked through before giving a stream up.
-constexpr int kMostPackets = 512;
+constexpr int kPacketsThatTellPixels = 512;
 
 }  // namespace
 
@@ -83,7 +83,7 @@ FrameOwner DecodeFirstPicture(AVFormatContext& input, int stream) {
         return nullptr;
     }
     UseOneStream(input, stream);
-    for (int i = 0; i < kMostPackets; ++i) {
+    for (int i = 0; i < kPacketsThatTellPixels; ++i) {
         const bool isEnd = av_read_frame(&input, packet.get()) < 0;
         if (isEnd || packet->stream_index == stream) {
             avcodec_send_packet(codec.get(), isEnd ? nullptr : packet.get());

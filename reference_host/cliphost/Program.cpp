@@ -1,0 +1,137 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/Program.h"
+
+#include <fmt/format.h>
+
+#include <cerrno>
+#include <cstdio>
+#include <iostream>
+#include <system_error>
+
+#include "host_interfaces/Version.h"
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/OutputProblem.h"
+#include "reference_host/cliphost/SettingsOptions.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/quicktime/MovieComponents.h"
+#include "reference_host/system/Process.h"
+#include "reference_host/util/text/Printable.h"
+
+namespace {
+
+void Tell(const std::string& text) {
+    cliphost::Notice("cliphost: {}\n", text);
+}
+
+// Printed text may get lost even here, when buffers are flushed.
+int OutputStatus(int error, int status) {
+    if (error == 0 || error == EPIPE) {
+        return status;  // a reader that went away has seen enough
+    }
+    Tell(LineOf(cliphost::NotWritten("standard output", error)));
+    return cliphost::kExitCaller;
+}
+
+int FlushOutput(int status) {
+    if (std::cout.good() && std::ferror(stdout) != 0) {
+        return status;  // it was told where it happened
+    }
+    errno = 0;
+    std::cout.flush();
+    if (std::fflush(stdout) == 0 && std::cout.good()) {
+        return status;
+    }
+    return OutputStatus(errno != 0 ? errno : EIO, status);
+}
+
+std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
+    std::string text = error.what();
+    const std::vector<std::string> rest = app->remaining();
+    if (app->get_subcommands().empty() && !rest.empty()) {
+        text = fmt::format("'{}' is neither a verb nor an option", rest.front());
+    }
+    return fmt::format("cliphost: {}\nRun with --help for more information.\n",
+                       host::text::PrintableLines(text));
+}
+
+int Run(int argc, char** argv) {
+    using namespace cliphost;
+    SessionOptions session;
+    session.program = host::system::ProgramFile(argv[0]);
+    session.programFolder = session.program.parent_path();
+    int status = kExitFine;
+
+    CLI::App app{
+        "Hosts the QuickTime plug-in: scans folders, describes movies as AAF, "
+        "maps and delivers their pictures and sound."};
+    app.name("cliphost");
+    app.require_subcommand(1);
+    app.fallthrough();
+    app.footer(
+        "Exit status: 0, everything was done; 1, the content of a file is at fault; 2, the call "
+        "is at fault:\na wrong option, a file that does not exist, an output that can't be "
+        "written. Of several failures\nthe highest counts.");
+    app.set_version_flag("--version", "cliphost " PRODUCT_VERSION_TEXT);
+    app.add_flag("-v", session.verbosity,
+                 "Show the module's console lines on standard error; -vv shows its log too");
+    app.add_option("--plugin", session.plugin,
+                   "Use this module file instead of the one beside the program");
+    app.add_option("--aaf-library", session.aafLibrary, "Use this build of the AAF library");
+
+    AddSettings(app, session.host);
+
+    AddScan(app, session, status);
+    AddDescribe(app, session, status);
+    AddSamples(app, session, status);
+    AddFormats(app, session, status);
+    AddFrame(app, session, status);
+    AddContact(app, session, status);
+    AddAudio(app, session, status);
+    AddTypes(app, session, status);
+    AddParams(app, session, status);
+    AddPlugin(app, session, status);
+
+    RefuseEmptyTexts(app);
+    TakeFileUrls(app);
+    app.failure_message(CommandLineProblem);
+
+    try {
+        app.parse(argc, argv);
+    } catch (const CLI::ParseError& error) {
+        return app.exit(error) == 0 ? kExitFine : kExitCaller;
+    } catch (const ReaderGone&) {
+        return status;  // it has seen enough
+    } catch (const Failure& failure) {
+        TellProblem(failure.problem(), session.verbosity);
+        return failure.status();
+    } catch (const host::MovieLibraryMissing& missing) {
+        Tell(std::string(missing.what()) + "; install cliphost anew, with all its files");
+        return kExitCaller;
+    } catch (const std::system_error& error) {
+        if (std::ferror(stdout) != 0) {
+            return OutputStatus(error.code().value(), status);
+        }
+        Tell(error.what());
+        return kExitFile;
+    } catch (const std::exception& error) {
+        Tell(error.what());
+        return kExitFile;
+    }
+    return status;
+}
+
+}  // namespace
+
+namespace cliphost {
+
+int RunProgram(int argc, char** argv) {
+    host::system::PrepareProcess();
+    return FlushOutput(Run(argc, argv));
+}
+
+}  // namespace cliphost
