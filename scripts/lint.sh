@@ -38,11 +38,11 @@ if ! bad=$(clang-format --dry-run -Werror "${files[@]}" 2>&1); then
   echo 'run clang-format -i on these files'
   failed=1
 fi
-# The module alone: of the rest, the compilers' own warnings are enough.
+# File by file, as the debug build compiles. The module alone: of the rest, the compilers' own warnings are enough.
 log=$(mktemp)
-cmake --preset asan >"$log" || { cat "$log"; exit 1; }
+cmake --preset debug >"$log" || { cat "$log"; exit 1; }
 if ! git ls-files 'source/*.cpp' | grep -v _windows \
-  | xargs -P "$(nproc)" -n 4 clang-tidy -p build/asan --quiet >"$log" 2>/dev/null; then
+  | xargs -P "$(nproc)" -n 4 clang-tidy -p build/debug --quiet >"$log" 2>/dev/null; then
   grep -E 'error:' "$log" | sort -u
   failed=1
 fi
