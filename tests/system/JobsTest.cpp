@@ -70,7 +70,7 @@ protected:
 
 constexpr char kPinned[] = " --pin-time 2026-01-31T12:00:00Z ";
 
-// Movies of all kinds, files that are none, and a path that is not there.
+// Movies, files that are none, and a path that is not there.
 class EqualJobs : public Jobs {
 protected:
     void SetUp() override {
@@ -80,43 +80,63 @@ protected:
         Write(movies::Bytes{}, "in/other.mp4");
         Copy("a\xFF.mov");
         Copy("back\\slash.mov");
-        paths_ = Quoted(MadeMoviesFolder()) + " " + In("in") + " " + In("absent.mov") + " " +
-                 Quoted(MadeMovie("png.mov")) + " " + Quoted(MadeMovie("aac.mov"));
+        rest_ = " " + In("in") + " " + In("absent.mov") + " " + Quoted(MadeMovie("png.mov")) + " " +
+                Quoted(MadeMovie("aac.mov"));
     }
-    std::string paths_;
+    // Movies of every kind, and a few that are enough for the forms of a call.
+    std::string All() { return Quoted(MadeMoviesFolder()) + rest_; }
+    std::string Few() {
+        for (const char* const name : {"dv_pal.mov", "h264_bframes.mov", "h264_with_aac.mov"}) {
+            std::filesystem::copy_file(MadeMovie(name), folder() / "in" / name,
+                                       std::filesystem::copy_options::overwrite_existing);
+        }
+        return rest_;
+    }
+    // Both outputs of one call.
+    struct Printed {
+        int status;
+        std::string out, told;
+    };
+    Printed Print(const std::string& call) {
+        const auto told = folder() / "told";
+        const CommandResult ran = RunCommand(Program() + " " + call + " 2>" + Quoted(told));
+        const movies::Bytes lines = ReadFile(told);
+        return {ran.status, ran.out, std::string(lines.begin(), lines.end())};
+    }
+    void ExpectTheSame(const std::string& call, const std::vector<std::string>& jobs) {
+        SCOPED_TRACE(call);
+        const Printed one = Print(call + " --jobs 1");
+        EXPECT_EQ(one.status, 2);
+        EXPECT_GT(CountOf(one.told, "cliphost: "), 4u);
+        for (const std::string& several : jobs) {
+            const Printed these = Print(call + several);
+            EXPECT_EQ(these.status, one.status) << several;
+            EXPECT_TRUE(these.out == one.out) << several;
+            EXPECT_EQ(these.told, one.told) << several;
+        }
+    }
+
+private:
+    std::string rest_;
 };
 
 TEST_F(EqualJobs, PrintTheSame) {
+    ExpectTheSame("-v describe --json" + std::string(kPinned) + All(), {" --jobs 2"});
     for (const char* const form : {"", "--json", "-q"}) {
-        SCOPED_TRACE(form);
-        const std::string call = std::string("-v describe ") + form + kPinned + paths_;
-        const CommandResult one = RunQuietly(call + " --jobs 1");
-        EXPECT_EQ(one.status, 2);
-        EXPECT_GT(one.out.size(), 1000u);
-        const CommandResult oneTold =
-            RunCommand(Program() + " " + call + " --jobs 1 2>&1 >/dev/null");
-        EXPECT_GT(CountOf(oneTold.out, "cliphost: "), 4u);
-        for (const char* const jobs :
-             {" --jobs 2", " --jobs 5", "", " --jobs 1 --limit-seconds 100"}) {
-            const CommandResult several = RunQuietly(call + jobs);
-            EXPECT_EQ(several.status, one.status) << jobs;
-            EXPECT_TRUE(several.out == one.out) << jobs;
-            const CommandResult told =
-                RunCommand(Program() + " " + call + jobs + " 2>&1 >/dev/null");
-            EXPECT_EQ(told.out, oneTold.out) << jobs;
-        }
+        ExpectTheSame("-v describe " + std::string(form) + kPinned + Few(),
+                      {" --jobs 2", " --jobs 5", "", " --jobs 1 --limit-seconds 100"});
     }
 }
 
 TEST_F(EqualJobs, SaveTheSame) {
     std::set<std::string> names;
     std::string printed;
-    for (const char* const jobs : {"1", "2", "5"}) {
+    for (const char* const jobs : {"1", "3"}) {
         SCOPED_TRACE(jobs);
         const auto out = folder() / "out";
         const CommandResult ran =
             RunCommand("TMPDIR=" + In("tmp") + " " + Program() + " describe --json" + kPinned +
-                       paths_ + " --jobs " + jobs + " --out-dir " + Quoted(out) + " 2>/dev/null");
+                       All() + " --jobs " + jobs + " --out-dir " + Quoted(out) + " 2>/dev/null");
         EXPECT_EQ(ran.status, 2);
         if (names.empty()) {
             names = NamesIn(out);
