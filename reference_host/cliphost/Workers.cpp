@@ -10,6 +10,7 @@
 #include <map>
 #include <memory>
 #include <optional>
+#include <thread>
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Fields.h"
@@ -30,6 +31,9 @@ constexpr char kEndOfMovie = '\0';
 constexpr std::size_t kMostTold = std::size_t{16} << 20;
 // Results that wait for one before them; more movies are not begun.
 constexpr std::size_t kMostWaiting = 256;
+// What lies ready for a process is to last so long, and is no more than so many requests.
+constexpr Clock::duration kTimeAhead = std::chrono::milliseconds(10);
+constexpr int kMostAhead = 32;
 constexpr char kNoAnswer[] = "the process that read it gave an answer that is none";
 constexpr std::size_t kMebibyte = std::size_t{1} << 20;
 
@@ -77,6 +81,8 @@ private:
     // False where the system has room for no more of them.
     bool Start(Worker& worker);
     std::optional<std::size_t> NextRequest();
+    std::size_t RequestsAhead() const;
+    bool AllHaveEnough() const;
     void Wait();
     void Listen(Worker& worker);
     void Hear(Worker& worker, const std::string& message);
@@ -95,6 +101,7 @@ private:
     std::deque<std::size_t> again_;
     std::map<std::size_t, WorkerResult> waiting_;
     std::size_t taken_ = 0;
+    Clock::duration usualTime_{0};  // of the last requests
 };
 
 void Run::MakeScratchFolder() {
@@ -134,9 +141,7 @@ void Run::GoOn() {
 }
 
 void Run::HandOut() {
-    // The next request lies ready where a process ends one, unless what it needs is measured.
-    const std::size_t most = call_.limits.mebibytes != 0 ? 1 : 2;
-    for (std::size_t depth = 1; depth <= most; ++depth) {
+    for (std::size_t depth = 1, most = RequestsAhead(); depth <= most; ++depth) {
         for (std::size_t i = 0; i < workers_.size(); ++i) {
             Worker& worker = *workers_[i];
             if (worker.requests.size() >= depth) {
@@ -154,6 +159,23 @@ void Run::HandOut() {
             HandTo(worker, *request);
         }
     }
+}
+
+// The next requests lie ready where a process ends one. Where each takes long, others may
+// have nothing to do in the end while they wait here.
+std::size_t Run::RequestsAhead() const {
+    if (call_.limits.mebibytes != 0) {
+        return 1;  // what each needs is measured
+    }
+    const auto inTime = kTimeAhead / std::max<Clock::duration>(usualTime_, kTimeAhead / kMostAhead);
+    return std::max<std::size_t>(2, static_cast<std::size_t>(inTime));
+}
+
+bool Run::AllHaveEnough() const {
+    const std::size_t ahead = RequestsAhead();
+    return ahead > 2 && std::all_of(workers_.begin(), workers_.end(), [=](const auto& worker) {
+               return worker->isReady && worker->requests.size() > ahead / 2;
+           });
 }
 
 void Run::HandTo(Worker& worker, std::size_t request) {
@@ -201,6 +223,11 @@ bool Run::Start(Worker& worker) {
 }
 
 void Run::Wait() {
+    if (AllHaveEnough()) {
+        // To be woken by each answer would take longer than the answer.
+        std::this_thread::sleep_for(kTimeAhead / 4);
+        return;
+    }
     std::vector<const host::system::ChildProcess*> running;
     for (const auto& worker : workers_) {
         if (worker->process.IsRunning()) {
@@ -298,7 +325,9 @@ void Run::Settle(Worker& worker, const std::string& failure) {
     waiting_.emplace(worker.requests.front(),
                      WorkerResult{TakeTold(worker), failure, worker.folder});
     worker.requests.pop_front();
-    worker.since = Clock::now();
+    const Clock::time_point now = Clock::now();
+    usualTime_ += (now - worker.since - usualTime_) / 8;
+    worker.since = now;
 }
 
 }  // namespace
@@ -319,14 +348,10 @@ bool ServeAsWorker(const std::filesystem::path& folder,
     const std::string missing = host::system::GiveUpRights(folder);
     std::fputc(kEndOfMovie, stderr);
     bool goesOn = ParentChannel::Write(FieldWriter().Add(missing).Message());
-    while (goesOn) {
-        std::string bytes(kLengthSize, '\0');
-        goesOn = ParentChannel::Read(bytes.data(), bytes.size());
-        const std::uint64_t length = goesOn ? LengthIn(bytes) : 0;
-        bytes.assign(std::min(length, kLongestMessage), '\0');
-        goesOn = goesOn && ParentChannel::Read(bytes.data(), bytes.size());
-        if (goesOn) {
-            FieldReader fields(bytes);
+    MessageStream requests;
+    while (goesOn && ParentChannel::Receive(requests.arrived())) {
+        while (const std::optional<std::string> request = goesOn ? requests.Next() : std::nullopt) {
+            FieldReader fields(*request);
             const std::uint64_t number = fields.Number();
             const std::string answered = answer(number, fields.Text());
             std::fputc(kEndOfMovie, stderr);

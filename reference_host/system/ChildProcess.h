@@ -61,8 +61,9 @@ class ParentChannel {
 public:
     // Whether this process was started as a child. It then ends when its parent does.
     static bool Join();
-    // Takes or sends all of the bytes; false when the parent has gone.
-    static bool Read(void* bytes, std::size_t size);
+    // Waits for bytes and appends those that are there. False when the parent has gone.
+    static bool Receive(std::string& bytes);
+    // Sends all of the bytes. False when the parent has gone.
     static bool Write(const std::string& bytes);
 };
 

@@ -13,6 +13,7 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <array>
 #include <cerrno>
 #include <csignal>
 #include <fstream>
@@ -199,20 +200,16 @@ bool ParentChannel::Join() {
     return true;
 }
 
-bool ParentChannel::Read(void* bytes, std::size_t size) {
-    char* to = static_cast<char*>(bytes);
-    while (size > 0) {
-        const ssize_t got = read(kChannel, to, size);
+bool ParentChannel::Receive(std::string& bytes) {
+    std::array<char, 4096> arrived;
+    for (;;) {
+        const ssize_t got = read(kChannel, arrived.data(), arrived.size());
         if (got < 0 && errno == EINTR) {
             continue;
         }
-        if (got <= 0) {
-            return false;
-        }
-        to += got;
-        size -= static_cast<std::size_t>(got);
+        bytes.append(arrived.data(), static_cast<std::size_t>(std::max<ssize_t>(got, 0)));
+        return got > 0;
     }
-    return true;
 }
 
 bool ParentChannel::Write(const std::string& bytes) {
