@@ -122,15 +122,17 @@ public:
     explicit TreeWriter(SectorSize sectorSize) : file_(sectorSize) {}
 
     Bytes Write(const StoredObject& root) {
-        Fill(file_.root(), root, 0);
+        Fill(CompoundFileWriter::kRoot, root, 0);
         // Tags are handed out on the way, so the table comes last. Readers
         // want it, even without a path in it.
-        file_.root().stream(kReferencedPropertiesStream, paths_.Table());
+        file_.AddStream(CompoundFileWriter::kRoot, kReferencedPropertiesStream, paths_.Table());
         return file_.Finish();
     }
 
 private:
-    void Fill(StorageWriter& storage, const StoredObject& object, int depth) {
+    using Storage = CompoundFileWriter::Storage;
+
+    void Fill(Storage storage, const StoredObject& object, int depth) {
         if (depth > kMaximumDepth) {
             throw StoredError("objects are nested too deep");
         }
@@ -149,28 +151,26 @@ private:
         WriteLayout(storage, object, layout, depth);
     }
 
-    void WriteLayout(StorageWriter& storage, const StoredObject& object, const Layout& layout,
-                     int depth) {
-        storage.SetClass(object.classId);
-        storage.stream(kPropertiesStream,
-                       ByteWriter()
-                           .AppendNumber(kLittleEndianMark)
-                           .AppendNumber(kPropertiesVersion)
-                           .AppendNumber(static_cast<std::uint16_t>(layout.count))
-                           .Append(layout.entries.bytes())
-                           .Append(layout.values.bytes())
-                           .bytes());
+    void WriteLayout(Storage storage, const StoredObject& object, const Layout& layout, int depth) {
+        file_.SetClass(storage, object.classId);
+        file_.AddStream(storage, kPropertiesStream,
+                        ByteWriter()
+                            .AppendNumber(kLittleEndianMark)
+                            .AppendNumber(kPropertiesVersion)
+                            .AppendNumber(static_cast<std::uint16_t>(layout.count))
+                            .Append(layout.entries.bytes())
+                            .Append(layout.values.bytes())
+                            .bytes());
         for (const Layout::Stream& stream : layout.streams) {
-            storage.stream(stream.name, stream.borrowed ? *stream.borrowed : stream.made);
+            file_.AddStream(storage, stream.name, stream.borrowed ? *stream.borrowed : stream.made);
         }
         for (const Layout::Child& child : layout.children) {
-            StorageWriter contained = storage.storage(child.name);
+            const Storage contained = file_.AddStorage(storage, child.name);
             try {
                 Fill(contained, *child.object, depth + 1);
             } catch (const StoredError& problem) {
                 throw StoredError(ToUtf8(child.name) + ": " + problem.what());
             }
-            contained.Close();
         }
     }
 
