@@ -154,8 +154,8 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     check(openNew(WideName(output.LeaveToOther()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
                   &identification, copy.Out()),
           "opening a new file");
+    // This saves the copy, too.
     check(file->SaveCopyAs(copy.get()), "copying the description");
-    check(copy->Save(), "saving");
     check(copy->Close(), "closing");
     output.Finish();
 }
