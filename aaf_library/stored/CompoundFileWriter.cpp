@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/CompoundFileWriter.h"
 
+#include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/StoredNames.h"
 #include "aaf_library/stored/UpperCase.h"
@@ -25,18 +26,15 @@ void CheckName(const std::u16string& name) {
     }
 }
 
-template <typename Number>
-void Put(std::uint8_t* at, Number value) {
-    for (std::size_t i = 0; i < sizeof(Number); ++i) {
-        at[i] = static_cast<std::uint8_t>(static_cast<std::uint64_t>(value) >> 8 * i);
-    }
+std::uint32_t NumberIn(const std::uint8_t* at) {
+    return at[0] | at[1] << 8 | at[2] << 16 | std::uint32_t{at[3]} << 24;
 }
 
 Bytes NumberBytes(const std::vector<std::uint32_t>& numbers) {
     Bytes bytes(numbers.size() * 4);
     std::uint8_t* at = bytes.data();
     for (std::uint32_t number : numbers) {
-        Put(at, number);
+        PutNumber(at, number);
         at += 4;
     }
     return bytes;
@@ -68,11 +66,11 @@ CompoundFileWriter::CompoundFileWriter(SectorSize sectorSize)
     std::copy(std::begin(kCompoundMagic), std::end(kCompoundMagic), header);
     const StoredAuid& signature = large_ ? kSignature4096 : kSignature512;
     std::copy(signature.begin(), signature.end(), header + kSignatureOffset);
-    Put(header + kMinorVersionOffset, kMinorVersion);
-    Put(header + kMajorVersionOffset, std::uint16_t(large_ ? 4 : 3));
-    Put(header + kByteOrderOffset, kByteOrderMark);
-    Put(header + kSectorShiftOffset, std::uint16_t(large_ ? 12 : 9));
-    Put(header + kSmallSectorShiftOffset, kSmallSectorShift);
+    PutNumber(header + kMinorVersionOffset, kMinorVersion);
+    PutNumber(header + kMajorVersionOffset, std::uint16_t(large_ ? 4 : 3));
+    PutNumber(header + kByteOrderOffset, kByteOrderMark);
+    PutNumber(header + kSectorShiftOffset, std::uint16_t(large_ ? 12 : 9));
+    PutNumber(header + kSmallSectorShiftOffset, kSmallSectorShift);
     SetHeader(kSmallLimitOffset, kSmallStreamLimit);
     AddEntry(kRoot, u"Root Entry", EntryKind::Root);
 }
@@ -96,6 +94,41 @@ void CompoundFileWriter::AddStream(Storage holder, const std::u16string& name,
     }
 }
 
+void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
+                                 const CompoundPart& part) {
+    const Storage storage = AddEntry(holder, name, EntryKind::Storage);
+    const auto sectorsBefore = static_cast<std::uint32_t>(smallTable_.size());
+    // Its root becomes this storage, and its other entries stand behind it.
+    directory_.insert(directory_.end(), part.directory.begin() + kDirectoryEntrySize,
+                      part.directory.end());
+    const std::uint8_t* const root = part.directory.data();
+    std::copy_n(root + kEntryClassOffset, sizeof(StoredAuid), EntryAt(storage) + kEntryClassOffset);
+    std::copy_n(root + kEntryChildOffset, 4, EntryAt(storage) + kEntryChildOffset);
+    const auto moveBy = [](std::uint8_t* at, std::uint32_t distance) {
+        const std::uint32_t number = NumberIn(at);
+        PutNumber(at, number > kLastPlainSector ? number : number + distance);
+    };
+    for (std::size_t at = storage * kDirectoryEntrySize; at < directory_.size();
+         at += kDirectoryEntrySize) {
+        std::uint8_t* const entry = directory_.data() + at;
+        moveBy(entry + kEntryRightOffset, storage);
+        moveBy(entry + kEntryChildOffset, storage);
+        moveBy(entry + kEntryStartOffset, sectorsBefore);
+    }
+    small_.insert(small_.end(), part.small.begin(), part.small.end());
+    for (std::uint32_t next : part.smallTable) {
+        smallTable_.push_back(next > kLastPlainSector ? next : next + sectorsBefore);
+    }
+}
+
+std::optional<CompoundPart> CompoundFileWriter::FinishPart() {
+    if (!table_.empty()) {
+        return std::nullopt;
+    }
+    LinkSiblings();
+    return CompoundPart{std::move(directory_), std::move(small_), std::move(smallTable_)};
+}
+
 Bytes CompoundFileWriter::Finish() {
     LinkSiblings();
     if (!small_.empty()) {
@@ -111,7 +144,7 @@ Bytes CompoundFileWriter::Finish() {
 std::uint32_t CompoundFileWriter::AddEntry(Storage holder, const std::u16string& name,
                                            EntryKind kind) {
     CheckName(name);
-    const auto index = static_cast<std::uint32_t>(places_.size());
+    const auto index = static_cast<std::uint32_t>(directory_.size() / kDirectoryEntrySize);
     Place& place = places_.emplace_back();
     place.holder = holder;
     place.length = name.size();
@@ -121,13 +154,13 @@ std::uint32_t CompoundFileWriter::AddEntry(Storage holder, const std::u16string&
     directory_.resize(directory_.size() + kDirectoryEntrySize);
     std::uint8_t* const entry = EntryAt(index);
     for (std::size_t i = 0; i < name.size(); ++i) {
-        Put(entry + 2 * i, name[i]);
+        PutNumber(entry + 2 * i, name[i]);
     }
-    Put(entry + kEntryNameSizeOffset, static_cast<std::uint16_t>(2 * name.size() + 2));
-    Put(entry + kEntryKindOffset, static_cast<std::uint8_t>(kind));
-    Put(entry + kEntryColourOffset, kBlack);
+    PutNumber(entry + kEntryNameSizeOffset, static_cast<std::uint16_t>(2 * name.size() + 2));
+    PutNumber(entry + kEntryKindOffset, static_cast<std::uint8_t>(kind));
+    PutNumber(entry + kEntryColourOffset, kBlack);
     for (std::size_t link : {kEntryLeftOffset, kEntryRightOffset, kEntryChildOffset}) {
-        Put(entry + link, kNoEntry);
+        PutNumber(entry + link, kNoEntry);
     }
     SetContent(index, kEndOfChain, 0);
     return index;
@@ -138,12 +171,12 @@ std::uint8_t* CompoundFileWriter::EntryAt(std::uint32_t index) {
 }
 
 void CompoundFileWriter::SetContent(std::uint32_t index, std::uint32_t start, std::size_t size) {
-    Put(EntryAt(index) + kEntryStartOffset, start);
-    Put(EntryAt(index) + kEntrySizeOffset, std::uint64_t{size});
+    PutNumber(EntryAt(index) + kEntryStartOffset, start);
+    PutNumber(EntryAt(index) + kEntrySizeOffset, std::uint64_t{size});
 }
 
 void CompoundFileWriter::SetHeader(std::size_t offset, std::size_t value) {
-    Put(file_.data() + offset, static_cast<std::uint32_t>(value));
+    PutNumber(file_.data() + offset, static_cast<std::uint32_t>(value));
 }
 
 // The entries of a storage are a search tree by length of name, then by its
@@ -163,9 +196,9 @@ void CompoundFileWriter::LinkSiblings() {
             throw StoredError("\"" + ToUtf8({place.name.data(), place.length}) +
                               "\" is twice in one storage");
         }
-        Put(first ? EntryAt(place.holder) + kEntryChildOffset
-                  : EntryAt(before.index) + kEntryRightOffset,
-            place.index);
+        PutNumber(first ? EntryAt(place.holder) + kEntryChildOffset
+                        : EntryAt(before.index) + kEntryRightOffset,
+                  place.index);
     }
 }
 

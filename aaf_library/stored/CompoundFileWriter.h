@@ -6,10 +6,19 @@
 #include "aaf_library/stored/StoredTree.h"
 
 #include <array>
+#include <optional>
 #include <string>
 #include <vector>
 
 namespace aaf::stored {
+
+// A storage with all that it contains, short streams alone, to be put into any file. Its entries
+// and sectors count from nought.
+struct CompoundPart {
+    Bytes directory;
+    Bytes small;
+    std::vector<std::uint32_t> smallTable;
+};
 
 // Lays a compound file out in memory. Its sectors come in this order: long
 // streams as they are added, the short streams as one and their table, the
@@ -27,8 +36,13 @@ public:
     Storage AddStorage(Storage holder, const std::u16string& name);
     void AddStream(Storage holder, const std::u16string& name, const Bytes& content);
 
+    // A copy of the part, under a name of its own.
+    void AddPart(Storage holder, const std::u16string& name, const CompoundPart& part);
+
     // Gives the whole file, signature included; once.
     Bytes Finish();
+    // Or the root as a part; none when it holds a long stream.
+    std::optional<CompoundPart> FinishPart();
 
 private:
     // A directory entry among those of its storage.

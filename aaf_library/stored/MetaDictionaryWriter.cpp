@@ -1,9 +1,14 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "aaf_library/model/GuidHash.h"
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/MetaKinds.h"
 #include "aaf_library/stored/ModelNames.h"
+#include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
+
+#include <mutex>
+#include <unordered_map>
 
 namespace aaf::stored {
 
@@ -166,22 +171,77 @@ StoredObject StoredType(const TypeFacts& record) {
     return definition.Take();
 }
 
-}  // namespace
+// Definitions that are the same in nearly every file, laid out when a file first needs them. Only
+// built-in ones, so that they are so many at most; as the first file had them.
+template <class Record>
+class LaidOutDefinitions {
+public:
+    explicit LaidOutDefinitions(StoredObject (*makeWhole)(const Record&)) : makeWhole_(makeWhole) {}
 
-StoredObject StoredMetaDictionary(const MetaRecords& records) {
+    StoredObject Definition(const Record& record, bool isBuiltIn) {
+        if (!isBuiltIn) {
+            return makeWhole_(record);
+        }
+        const std::lock_guard<std::mutex> lock(mutex_);
+        auto place = known_.find(record.id);
+        if (place == known_.end()) {
+            Known made{record, makeWhole_(record)};
+            if (auto laidOut = LayOut(made.object, {kClassPath, kTypePath})) {
+                made.object.properties.resize(1);  // the key, in a set of definitions
+                made.object.laidOut = std::move(laidOut);
+            }
+            place = known_.emplace(record.id, std::move(made)).first;
+        }
+        const Known& known = place->second;
+        return known.record == record ? known.object : makeWhole_(record);
+    }
+
+private:
+    struct Known {
+        Record record;
+        StoredObject object;
+    };
+
+    StoredObject (*const makeWhole_)(const Record&);
+    std::mutex mutex_;
+    std::unordered_map<GUID, Known, GuidHash> known_;
+};
+
+StoredObject LaidOutClass(const MetaClass& record) {
+    static LaidOutDefinitions<MetaClass> known(StoredClass);
+    return known.Definition(record, FindBuiltInClass(record.id) != nullptr);
+}
+
+StoredObject LaidOutType(const TypeFacts& record) {
+    static LaidOutDefinitions<TypeFacts> known(StoredType);
+    return known.Definition(record, FindBuiltInType(record.id) != nullptr);
+}
+
+StoredObject MetaDictionaryOf(const MetaRecords& records, StoredObject (*classOf)(const MetaClass&),
+                              StoredObject (*typeOf)(const TypeFacts&)) {
     StoredProperty classes = DefinitionSet(meta::kClassDefinitions, u"ClassDefinitions");
     for (const MetaClass& record : records.classes) {
-        AddTo(classes, record.id, StoredClass(record));
+        AddTo(classes, record.id, classOf(record));
     }
     StoredProperty types = DefinitionSet(meta::kTypeDefinitions, u"TypeDefinitions");
     for (const TypeFacts& record : records.types) {
-        AddTo(types, record.id, StoredType(record));
+        AddTo(types, record.id, typeOf(record));
     }
     StoredObject dictionary;
     dictionary.classId = AuidOf(AUID_AAFMetaDictionary);
     dictionary.properties.push_back(std::move(classes));
     dictionary.properties.push_back(std::move(types));
     return dictionary;
+}
+
+}  // namespace
+
+StoredObject StoredMetaDictionary(const MetaRecords& records) {
+    return MetaDictionaryOf(records, StoredClass, StoredType);
+}
+
+StoredObject LaidOutMetaDictionary(const MetaRecords& records) {
+    return MetaDictionaryOf(records, LaidOutClass, LaidOutType);
 }
 
 }  // namespace aaf::stored

@@ -37,8 +37,13 @@ struct MetaRecords {
     std::vector<TypeFacts> types;
 };
 
+bool operator==(const MetaProperty& left, const MetaProperty& right);
+bool operator==(const MetaClass& left, const MetaClass& right);
+
 // The object that the root holds as its MetaDictionary.
 StoredObject StoredMetaDictionary(const MetaRecords& records);
+// The same for writing alone: built-in definitions are laid out once for the process.
+StoredObject LaidOutMetaDictionary(const MetaRecords& records);
 
 // Definitions of a kind that nobody knows are passed over. Throws StoredError.
 MetaRecords ReadMetaDictionary(const StoredObject& metaDictionary);

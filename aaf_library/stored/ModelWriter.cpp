@@ -47,7 +47,10 @@ void SortByPid(StoredObject& object) {
 
 class ModelWriter {
 public:
-    explicit ModelWriter(Model& model) : model_(model), closure_(model) {}
+    using MetaDictionary = StoredObject (*)(const MetaRecords&);
+
+    ModelWriter(Model& model, MetaDictionary metaDictionary)
+        : model_(model), closure_(model), metaDictionary_(metaDictionary) {}
 
     StoredObject Write(Object& header) {
         StoredObject storedHeader = StoredObjectOf(header, prop::Header_Dictionary.pid);
@@ -60,7 +63,7 @@ public:
         StoredObject root;
         root.classId = kRootClassId;
         root.properties.push_back(ReferenceTo(meta::kRootMetaDictionary, u"MetaDictionary",
-                                              StoredMetaDictionary(closure_.records())));
+                                              metaDictionary_(closure_.records())));
         root.properties.push_back(
             ReferenceTo(meta::kRootHeader, u"Header", std::move(storedHeader)));
         return root;
@@ -324,6 +327,7 @@ private:
 
     Model& model_;
     MetaClosure closure_;
+    const MetaDictionary metaDictionary_;
     std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
     std::map<const ClassDefinition*, std::vector<const PropertyDefinition*>> required_;
 };
@@ -331,7 +335,11 @@ private:
 }  // namespace
 
 StoredObject TreeOfModel(Model& model, Object& header) {
-    return ModelWriter(model).Write(header);
+    return ModelWriter(model, StoredMetaDictionary).Write(header);
+}
+
+StoredObject TreeToWrite(Model& model, Object& header) {
+    return ModelWriter(model, LaidOutMetaDictionary).Write(header);
 }
 
 }  // namespace aaf::stored

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/TreeWriter.h"
 
-#include "aaf_library/stored/CompoundFileWriter.h"
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/PropertyFormat.h"
 #include "aaf_library/stored/StoredNames.h"
@@ -33,7 +32,7 @@ constexpr std::size_t kLargestValue = 0xFFFF;
 // its tag when it is used first.
 class TargetPaths {
 public:
-    std::uint16_t tag(const std::vector<std::uint16_t>& path) {
+    std::uint16_t tag(const TargetPath& path) {
         const bool bad = path.empty() || std::find(path.begin(), path.end(), 0) != path.end();
         if (bad) {
             throw StoredError("a weak reference without a path to its targets");
@@ -48,9 +47,17 @@ public:
         return tag;
     }
 
+    void BeginWith(const std::vector<TargetPath>& paths) {
+        for (std::size_t i = 0; i < paths.size(); ++i) {
+            if (tag(paths[i]) != i) {
+                throw StoredError("an object was laid out for another table of targets");
+            }
+        }
+    }
+
     Bytes Table() const {
         ByteWriter pids;
-        for (const std::vector<std::uint16_t>& path : paths_) {
+        for (const TargetPath& path : paths_) {
             for (std::uint16_t pid : path) {
                 pids.AppendNumber(pid);
             }
@@ -65,8 +72,8 @@ public:
     }
 
 private:
-    std::vector<std::vector<std::uint16_t>> paths_;
-    std::map<std::vector<std::uint16_t>, std::uint16_t> tags_;
+    std::vector<TargetPath> paths_;
+    std::map<TargetPath, std::uint16_t> tags_;
 };
 
 // What an object's storage holds besides its property table. Names cannot
@@ -129,6 +136,14 @@ public:
         return file_.Finish();
     }
 
+    std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
+                                          const std::vector<TargetPath>& paths) {
+        paths_.BeginWith(paths);
+        Fill(CompoundFileWriter::kRoot, object, 0);
+        std::optional<CompoundPart> part = file_.FinishPart();
+        return part ? std::make_shared<const LaidOut>(LaidOut{std::move(*part), paths}) : nullptr;
+    }
+
 private:
     using Storage = CompoundFileWriter::Storage;
 
@@ -165,6 +180,11 @@ private:
             file_.AddStream(storage, stream.name, stream.borrowed ? *stream.borrowed : stream.made);
         }
         for (const Layout::Child& child : layout.children) {
+            if (const LaidOut* const known = child.object->laidOut.get()) {
+                paths_.BeginWith(known->paths);
+                file_.AddPart(storage, child.name, known->part);
+                continue;
+            }
             const Storage contained = file_.AddStorage(storage, child.name);
             try {
                 Fill(contained, *child.object, depth + 1);
@@ -317,6 +337,11 @@ private:
 
 Bytes WriteTree(const StoredObject& root, SectorSize sectorSize) {
     return TreeWriter(sectorSize).Write(root);
+}
+
+std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
+                                      const std::vector<TargetPath>& paths) {
+    return TreeWriter(SectorSize::Bytes512).LayOut(object, paths);
 }
 
 }  // namespace aaf::stored
