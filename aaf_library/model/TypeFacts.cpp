@@ -120,6 +120,22 @@ HRESULT Setup(TypeDefinition& type, Model& model, const TypeFacts& facts) {
     }
 }
 
+std::vector<TypeFacts> AllBuiltInFacts() {
+    std::vector<TypeFacts> all;
+    all.reserve(BuiltInTypes().size());
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        std::vector<TypeMember> members;
+        for (const BuiltInMember& member : entry.members) {
+            members.push_back({Widen(member.name), member.id, member.value});
+        }
+        all.push_back({entry.id, Widen(entry.name), entry.kind, entry.target, entry.size,
+                       entry.isSigned, std::move(members)});
+    }
+    return all;
+}
+
+}  // namespace
+
 TypeMembers MembersOf(const TypeDefinition& type) {
     switch (type.kind()) {
         case TypeKind::Enumeration:
@@ -138,28 +154,6 @@ TypeMembers MembersOf(const TypeDefinition& type) {
         default:
             return {};
     }
-}
-
-std::vector<TypeFacts> AllBuiltInFacts() {
-    std::vector<TypeFacts> all;
-    all.reserve(BuiltInTypes().size());
-    for (const BuiltInType& entry : BuiltInTypes()) {
-        std::vector<TypeMember> members;
-        for (const BuiltInMember& member : entry.members) {
-            members.push_back({Widen(member.name), member.id, member.value});
-        }
-        all.push_back({entry.id, Widen(entry.name), entry.kind, entry.target, entry.size,
-                       entry.isSigned, std::move(members)});
-    }
-    return all;
-}
-
-}  // namespace
-
-bool operator==(const TypeFacts& left, const TypeFacts& right) {
-    return left.id == right.id && left.name == right.name && left.kind == right.kind &&
-           left.target == right.target && left.size == right.size &&
-           left.isSigned == right.isSigned && left.members == right.members;
 }
 
 const TypeFacts& FactsOf(const BuiltInType& entry) {

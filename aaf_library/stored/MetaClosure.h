@@ -35,6 +35,7 @@ private:
     void AddPending();
     void EnterClass(const GUID& id);
     void EnterType(const GUID& id);
+    void AddTypesIn(const TypeFacts& type);
 
     Model& model_;
     MetaRecords records_;

@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "aaf_library/model/GuidHash.h"
+#include "aaf_library/model/BuiltIn.h"
+#include "aaf_library/model/Text.h"
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/MetaKinds.h"
 #include "aaf_library/stored/ModelNames.h"
@@ -8,7 +9,6 @@
 #include "host_interfaces/aaf/AAFClassIds.h"
 
 #include <mutex>
-#include <unordered_map>
 
 namespace aaf::stored {
 
@@ -171,61 +171,75 @@ StoredObject StoredType(const TypeFacts& record) {
     return definition.Take();
 }
 
-// Definitions that are the same in nearly every file, laid out when a file first needs them. Only
-// built-in ones, so that they are so many at most; as the first file had them.
-template <class Record>
-class LaidOutDefinitions {
-public:
-    explicit LaidOutDefinitions(StoredObject (*makeWhole)(const Record&)) : makeWhole_(makeWhole) {}
+StoredObject StoredBuiltInClass(const BuiltInClass& entry) {
+    MetaClass record{entry.id, Widen(entry.name), entry.parent, entry.concrete, {}};
+    for (const BuiltInProperty& property : entry.properties) {
+        record.properties.push_back({property.key.id, Widen(property.name), property.key.pid,
+                                     property.type, property.optional, property.unique});
+    }
+    return StoredClass(record);
+}
 
-    StoredObject Definition(const Record& record, bool isBuiltIn) {
-        if (!isBuiltIn) {
-            return makeWhole_(record);
-        }
-        const std::lock_guard<std::mutex> lock(mutex_);
-        auto place = known_.find(record.id);
-        if (place == known_.end()) {
-            Known made{record, makeWhole_(record)};
-            if (auto laidOut = LayOut(made.object, {kClassPath, kTypePath})) {
-                made.object.properties.resize(1);  // the key, in a set of definitions
-                made.object.laidOut = std::move(laidOut);
+StoredObject StoredBuiltInType(const BuiltInType& entry) {
+    return StoredType(FactsOf(entry));
+}
+
+// The definitions of a built-in table, each laid out when a file first needs it.
+template <class Entry>
+class LaidOutTable {
+public:
+    LaidOutTable(Span<Entry> table, StoredObject (*makeWhole)(const Entry&))
+        : table_(table), makeWhole_(makeWhole), places_(new Place[table.size()]) {}
+
+    const StoredObject& Definition(const Entry& entry) {
+        Place& place = places_[static_cast<std::size_t>(&entry - table_.begin())];
+        std::call_once(place.once, [&] {
+            place.object = makeWhole_(entry);
+            if (auto laidOut = LayOut(place.object, {kClassPath, kTypePath})) {
+                place.object.properties.resize(1);  // the key in the set of definitions
+                place.object.laidOut = std::move(laidOut);
             }
-            place = known_.emplace(record.id, std::move(made)).first;
-        }
-        const Known& known = place->second;
-        return known.record == record ? known.object : makeWhole_(record);
+        });
+        return place.object;
     }
 
 private:
-    struct Known {
-        Record record;
+    struct Place {
+        std::once_flag once;
         StoredObject object;
     };
 
-    StoredObject (*const makeWhole_)(const Record&);
-    std::mutex mutex_;
-    std::unordered_map<GUID, Known, GuidHash> known_;
+    const Span<Entry> table_;
+    StoredObject (*const makeWhole_)(const Entry&);
+    const std::unique_ptr<Place[]> places_;
 };
 
-StoredObject LaidOutClass(const MetaClass& record) {
-    static LaidOutDefinitions<MetaClass> known(StoredClass);
-    return known.Definition(record, FindBuiltInClass(record.id) != nullptr);
+StoredObject LaidOutClass(const BuiltInClass& entry) {
+    static LaidOutTable<BuiltInClass> table(BuiltInClasses(), StoredBuiltInClass);
+    return table.Definition(entry);
 }
 
-StoredObject LaidOutType(const TypeFacts& record) {
-    static LaidOutDefinitions<TypeFacts> known(StoredType);
-    return known.Definition(record, FindBuiltInType(record.id) != nullptr);
+StoredObject LaidOutType(const BuiltInType& entry) {
+    static LaidOutTable<BuiltInType> table(BuiltInTypes(), StoredBuiltInType);
+    return table.Definition(entry);
 }
 
-StoredObject MetaDictionaryOf(const MetaRecords& records, StoredObject (*classOf)(const MetaClass&),
-                              StoredObject (*typeOf)(const TypeFacts&)) {
+StoredObject MetaDictionaryOf(const MetaRecords& records,
+                              StoredObject (*builtInClass)(const BuiltInClass&),
+                              StoredObject (*builtInType)(const BuiltInType&)) {
     StoredProperty classes = DefinitionSet(meta::kClassDefinitions, u"ClassDefinitions");
     for (const MetaClass& record : records.classes) {
-        AddTo(classes, record.id, classOf(record));
+        AddTo(classes, record.id, StoredClass(record));
+    }
+    for (const BuiltInClass* entry : records.builtInClasses) {
+        AddTo(classes, entry->id, builtInClass(*entry));
     }
     StoredProperty types = DefinitionSet(meta::kTypeDefinitions, u"TypeDefinitions");
     for (const TypeFacts& record : records.types) {
-        AddTo(types, record.id, typeOf(record));
+        AddTo(types, record.id, StoredType(record));
+    }
+    for (const BuiltInType* entry : records.builtInTypes) {
+        AddTo(types, entry->id, builtInType(*entry));
     }
     StoredObject dictionary;
     dictionary.classId = AuidOf(AUID_AAFMetaDictionary);
@@ -237,7 +251,7 @@ StoredObject MetaDictionaryOf(const MetaRecords& records, StoredObject (*classOf
 }  // namespace
 
 StoredObject StoredMetaDictionary(const MetaRecords& records) {
-    return MetaDictionaryOf(records, StoredClass, StoredType);
+    return MetaDictionaryOf(records, StoredBuiltInClass, StoredBuiltInType);
 }
 
 StoredObject LaidOutMetaDictionary(const MetaRecords& records) {

@@ -32,17 +32,6 @@ std::uint16_t TargetPidOf(TypeKind kind) {
     }
 }
 
-bool operator==(const MetaProperty& left, const MetaProperty& right) {
-    return left.id == right.id && left.name == right.name && left.pid == right.pid &&
-           left.type == right.type && left.optional == right.optional &&
-           left.unique == right.unique;
-}
-
-bool operator==(const MetaClass& left, const MetaClass& right) {
-    return left.id == right.id && left.name == right.name && left.parent == right.parent &&
-           left.concrete == right.concrete && left.properties == right.properties;
-}
-
 StoredAuid AuidOf(const GUID& id) {
     StoredAuid out;
     PutNumber(out.data(), static_cast<std::uint32_t>(id.Data1));

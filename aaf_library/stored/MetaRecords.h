@@ -35,14 +35,14 @@ struct MetaClass {
 struct MetaRecords {
     std::vector<MetaClass> classes;
     std::vector<TypeFacts> types;
+    // Those that say nothing else than the built-in model, where somebody cares.
+    std::vector<const BuiltInClass*> builtInClasses;
+    std::vector<const BuiltInType*> builtInTypes;
 };
-
-bool operator==(const MetaProperty& left, const MetaProperty& right);
-bool operator==(const MetaClass& left, const MetaClass& right);
 
 // The object that the root holds as its MetaDictionary.
 StoredObject StoredMetaDictionary(const MetaRecords& records);
-// The same for writing alone: built-in definitions are laid out once for the process.
+// The same for writing alone: what is as built in is laid out once for the process.
 StoredObject LaidOutMetaDictionary(const MetaRecords& records);
 
 // Definitions of a kind that nobody knows are passed over. Throws StoredError.

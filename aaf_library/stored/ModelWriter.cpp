@@ -258,25 +258,30 @@ private:
     // Of the definitions that every model has from the start only those are
     // stored that something refers to. A definition may refer to others, so
     // the sets are gone through until nothing is added.
-    StoredObject StoredDictionary(const Object& from) {
+    StoredObject StoredDictionary(const Dictionary& from) {
         StoredObject out;
         out.classId = AuidOf(from.classId());
         closure_.AddClass(from.classId());
-        std::map<PropertyId, StoredProperty> sets;
-        for (const auto& entry : from.values()) {
-            if (StoredFormOf(entry.second->type()) == StoredForm::StrongSet) {
-                sets[entry.first] =
-                    EmptyProperty(*from.classDefinition().FindProperty(entry.first));
-            } else {
-                out.properties.push_back(StoredPropertyOf(from, entry.first, *entry.second));
+        for (const auto& [pid, value] : from.MadeValues()) {
+            if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
+                out.properties.push_back(StoredPropertyOf(from, pid, *value));
             }
         }
+        std::map<PropertyId, StoredProperty> sets;
         std::set<const Object*> stored;
         std::size_t before = 0;
         do {
             before = stored.size();
-            for (auto& set : sets) {
-                AddDefinitions(set.second, from.values().at(set.first)->objects(), stored);
+            MakeTargets(from);
+            for (const auto& [pid, value] : from.MadeValues()) {
+                if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
+                    continue;
+                }
+                const auto [set, isNew] = sets.try_emplace(pid);
+                if (isNew) {
+                    set->second = EmptyProperty(*from.classDefinition().FindProperty(pid));
+                }
+                AddDefinitions(set->second, value->objects(), stored);
             }
         } while (stored.size() != before);
         for (auto& set : sets) {
@@ -287,6 +292,21 @@ private:
         CheckTargets(out);
         SortByPid(out);
         return out;
+    }
+
+    // A built-in definition may be referred to before anybody has looked it up.
+    void MakeTargets(const Dictionary& dictionary) {
+        for (const auto& [path, keys] : targets_) {
+            if (IsWithinDictionary(path)) {
+                for (const Bytes& key : keys) {
+                    dictionary.FindDefinition(path[2], GuidOf(key));
+                }
+            }
+        }
+    }
+
+    static bool IsWithinDictionary(const Path& path) {
+        return path.size() == 3 && path[1] == prop::Header_Dictionary.pid;
     }
 
     void AddDefinitions(StoredProperty& set, const std::vector<RefPtr<Object>>& definitions,
@@ -306,7 +326,7 @@ private:
     void CheckTargets(const StoredObject& dictionary) {
         for (const auto& entry : targets_) {
             const Path& path = entry.first;
-            if (path.size() != 3 || path[1] != prop::Header_Dictionary.pid) {
+            if (!IsWithinDictionary(path)) {
                 continue;
             }
             const StoredProperty* set = dictionary.Find(path[2]);

@@ -48,7 +48,9 @@ public:
     }
 
     void BeginWith(const std::vector<TargetPath>& paths) {
-        for (std::size_t i = 0; i < paths.size(); ++i) {
+        const bool isBegun =
+            paths.size() <= paths_.size() && std::equal(paths.begin(), paths.end(), paths_.begin());
+        for (std::size_t i = 0; !isBegun && i < paths.size(); ++i) {
             if (tag(paths[i]) != i) {
                 throw StoredError("an object was laid out for another table of targets");
             }
