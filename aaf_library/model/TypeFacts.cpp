@@ -156,6 +156,12 @@ TypeMembers MembersOf(const TypeDefinition& type) {
     }
 }
 
+bool operator==(const TypeFacts& left, const TypeFacts& right) {
+    return left.id == right.id && left.name == right.name && left.kind == right.kind &&
+           left.target == right.target && left.size == right.size &&
+           left.isSigned == right.isSigned && left.members == right.members;
+}
+
 const TypeFacts& FactsOf(const BuiltInType& entry) {
     static const std::vector<TypeFacts> all = AllBuiltInFacts();
     return all[static_cast<std::size_t>(&entry - BuiltInTypes().begin())];

@@ -8,6 +8,9 @@
 #include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 
+#include <algorithm>
+#include <deque>
+#include <memory>
 #include <mutex>
 
 namespace aaf::stored {
@@ -254,8 +257,29 @@ StoredObject StoredMetaDictionary(const MetaRecords& records) {
     return MetaDictionaryOf(records, StoredBuiltInClass, StoredBuiltInType);
 }
 
+// Movies of one kind need the same definitions, so the last few dictionaries are kept.
 StoredObject LaidOutMetaDictionary(const MetaRecords& records) {
-    return MetaDictionaryOf(records, LaidOutClass, LaidOutType);
+    struct Known {
+        MetaRecords records;
+        StoredObject dictionary;
+    };
+    constexpr std::size_t most = 8;
+    static std::mutex mutex;
+    static std::deque<Known> lastOnes;
+    const std::lock_guard<std::mutex> lock(mutex);
+    const auto known = std::find_if(lastOnes.begin(), lastOnes.end(),
+                                    [&](const Known& one) { return one.records == records; });
+    if (known != lastOnes.end()) {
+        return known->dictionary;
+    }
+    StoredObject dictionary = MetaDictionaryOf(records, LaidOutClass, LaidOutType);
+    if (auto laidOut = LayOut(dictionary, {kClassPath, kTypePath})) {
+        dictionary.properties.clear();
+        dictionary.laidOut = std::move(laidOut);
+        lastOnes.push_front({records, dictionary});
+        lastOnes.resize(std::min(lastOnes.size(), most));
+    }
+    return dictionary;
 }
 
 }  // namespace aaf::stored

@@ -40,9 +40,11 @@ struct MetaRecords {
     std::vector<const BuiltInType*> builtInTypes;
 };
 
+bool operator==(const MetaRecords& left, const MetaRecords& right);
+
 // The object that the root holds as its MetaDictionary.
 StoredObject StoredMetaDictionary(const MetaRecords& records);
-// The same for writing alone: what is as built in is laid out once for the process.
+// The same for writing alone: what files have in common is laid out once.
 StoredObject LaidOutMetaDictionary(const MetaRecords& records);
 
 // Definitions of a kind that nobody knows are passed over. Throws StoredError.

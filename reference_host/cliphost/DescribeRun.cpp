@@ -254,6 +254,10 @@ std::filesystem::path DescribeRun::TargetFor(const std::filesystem::path& movie)
             target = free;
         }
     }
+    std::error_code ignored;
+    if (!std::filesystem::exists(target, ignored)) {
+        return target;  // so it is no movie
+    }
     RefuseOutputOntoMovie(target, movie);
     for (const std::filesystem::path& other : options_.paths) {
         RefuseOutputOntoMovie(target, other);
