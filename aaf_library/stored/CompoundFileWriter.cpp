@@ -131,6 +131,9 @@ std::optional<CompoundPart> CompoundFileWriter::FinishPart() {
 
 Bytes CompoundFileWriter::Finish() {
     LinkSiblings();
+    // Room for all that follows but the table of a file of megabytes.
+    file_.reserve(file_.size() + small_.size() + small_.size() / 16 + directory_.size() +
+                  8 * sectorSize_);
     if (!small_.empty()) {
         SetContent(kRoot, AppendSectors(small_), small_.size());
     }

@@ -9,7 +9,6 @@
 #include <algorithm>
 #include <map>
 #include <numeric>
-#include <set>
 
 // An object becomes a storage with a stream "properties":
 //
@@ -154,10 +153,15 @@ private:
             throw StoredError("objects are nested too deep");
         }
         Layout layout;
-        std::set<std::uint16_t> pids;
+        std::vector<std::uint16_t> pids;
+        for (const StoredProperty& property : object.properties) {
+            pids.push_back(property.pid);
+        }
+        std::sort(pids.begin(), pids.end());
+        const auto twice = std::adjacent_find(pids.begin(), pids.end());
         for (const StoredProperty& property : object.properties) {
             try {
-                if (!pids.insert(property.pid).second) {
+                if (twice != pids.end() && property.pid == *twice) {
                     throw StoredError("occurs twice in one object");
                 }
                 AddProperty(layout, property);
