@@ -118,7 +118,8 @@ void DescribeFolder(benchmark::State& state) {
 // As with --out-dir; every pass but the first replaces the files of the one before.
 void DescribeAndSaveFolder(benchmark::State& state) {
     DescribeAll(state, [](const cliphost::FolderClip& clip) {
-        return Saved().Path() / clip.path.filename().replace_extension(".aaf");
+        return Saved().Path() /
+               std::filesystem::path(clip.path).filename().replace_extension(".aaf");
     });
 }
 
