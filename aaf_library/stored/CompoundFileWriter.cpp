@@ -98,6 +98,11 @@ void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
                                  const CompoundPart& part) {
     const Storage storage = AddEntry(holder, name, EntryKind::Storage);
     const auto sectorsBefore = static_cast<std::uint32_t>(smallTable_.size());
+    if (part.directory.size() > directory_.size()) {
+        // Leaves room for what follows the large part of a file.
+        directory_.reserve(part.directory.size() * 3 / 2);
+        small_.reserve(small_.size() + part.small.size() * 3 / 2);
+    }
     // Its root becomes this storage, and its other entries stand behind it.
     directory_.insert(directory_.end(), part.directory.begin() + kDirectoryEntrySize,
                       part.directory.end());

@@ -21,6 +21,8 @@ void PutNumber(std::uint8_t* at, Number value) {
 // Appends numbers to bytes, little-endian and without padding.
 class ByteWriter {
 public:
+    ByteWriter() { bytes_.reserve(64); }  // most values are shorter
+
     template <typename Number>
     ByteWriter& AppendNumber(Number value) {
         std::uint8_t bytes[sizeof(Number)];

@@ -85,6 +85,7 @@ private:
         StoredObject out;
         out.classId = AuidOf(from.classId());
         closure_.AddClass(from.classId());
+        out.properties.reserve(from.values().size() + 2);
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
                 out.properties.push_back(StoredPropertyOf(from, entry.first, *entry.second));
@@ -145,8 +146,10 @@ private:
     StoredProperty EmptyProperty(const PropertyDefinition& definition) {
         StoredProperty out;
         out.pid = definition.pid();
-        out.name = Utf16Of(definition.name());
         out.form = StoredFormOf(*definition.type());
+        if (out.form != StoredForm::Data && out.form != StoredForm::WeakReference) {
+            out.name = Utf16Of(definition.name());
+        }
         if (out.form == StoredForm::StrongSet) {
             const TypeFacts target = FactsOf(ReferenceIn(*definition.type()));
             const PropertyDefinition* key = KeyOf(target.target);

@@ -154,6 +154,7 @@ private:
         }
         Layout layout;
         std::vector<std::uint16_t> pids;
+        pids.reserve(object.properties.size());
         for (const StoredProperty& property : object.properties) {
             pids.push_back(property.pid);
         }
