@@ -91,6 +91,9 @@ void MetaClosure::EnterClass(const GUID& id) {
     }
     const BuiltInClass* const entry = FindBuiltInClass(id);
     if (entry != nullptr && model_.HasAsBuiltIn(*entry)) {
+        if (builtIn_ == BuiltIn::LeftOut) {
+            return;
+        }
         records_.builtInClasses.push_back(entry);
         pendingClasses_.push_back(entry->parent);
         for (const BuiltInProperty& property : entry->properties) {
@@ -116,6 +119,9 @@ void MetaClosure::EnterType(const GUID& id) {
     }
     const BuiltInType* const entry = FindBuiltInType(id);
     if (entry != nullptr && model_.HasAsBuiltIn(*entry)) {
+        if (builtIn_ == BuiltIn::LeftOut) {
+            return;
+        }
         records_.builtInTypes.push_back(entry);
         AddTypesIn(FactsOf(*entry));
         return;
