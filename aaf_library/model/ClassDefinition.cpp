@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/ClassDefinition.h"
 
+#include <algorithm>
+
 #include "aaf_library/model/Enumerator.h"
 #include "aaf_library/model/Model.h"
 #include "aaf_library/model/TypeDefinition.h"
@@ -38,6 +40,12 @@ bool ClassDefinition::IsKindOf(const GUID& classId) const {
         }
     }
     return false;
+}
+
+bool ClassDefinition::IsAsBuiltIn() const {
+    return !IsExtended() && !IsRenamed() &&
+           std::none_of(properties_.begin(), properties_.end(),
+                        [](const auto& property) { return property && property->IsRenamed(); });
 }
 
 // What a search looks at, of a row of the shared table or of a definition.

@@ -32,6 +32,8 @@ public:
     const std::vector<RefPtr<PropertyDefinition>>& properties();
     // Whether it has more than the built-in model knows.
     bool IsExtended() const { return !IsBuiltIn() || properties_.size() > builtIn_.size(); }
+    // Whether all that it says stands in the built-in model.
+    bool IsAsBuiltIn() const;
     // This class and its parents; null when unknown.
     PropertyDefinition* FindProperty(const GUID& id);
     PropertyDefinition* FindProperty(PropertyId pid);

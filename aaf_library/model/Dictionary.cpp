@@ -75,6 +75,15 @@ Object* Dictionary::FindDefinition(const GUID& classId, const GUID& id) const {
     return set == nullptr ? nullptr : Find(*set, id);
 }
 
+Object* Dictionary::FindDefinition(PropertyId set, const GUID& id) const {
+    for (const DefinitionSet& entry : kSets) {
+        if (entry.set.pid == set) {
+            return Find(entry.set, id);
+        }
+    }
+    return nullptr;
+}
+
 Object* Dictionary::FindMade(const PropertyKey& set, const GUID& id) const {
     Bytes key;
     AppendGuid(id, key);

@@ -14,6 +14,8 @@ class Dictionary : public Implements<Object, IAAFDictionary, IAAFDictionary2> {
 public:
     // The registered definition of that class, or null.
     Object* FindDefinition(const GUID& classId, const GUID& id) const;
+    // The same by the property that holds the set.
+    Object* FindDefinition(PropertyId set, const GUID& id) const;
     // Adds one of that class; its id must be new.
     HRESULT AddDefinition(const GUID& classId, Object* definition);
 

@@ -59,6 +59,7 @@ HRESULT MetaDefinition::SetName(aafCharacter_constptr name) {
     }
     builtInName_ = nullptr;
     name_ = name;
+    renamed_ = true;
     return AAFRESULT_SUCCESS;
 }
 

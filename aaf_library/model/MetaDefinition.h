@@ -20,6 +20,7 @@ public:
     // Part of the built-in model, as opposed to registered by a caller or read from a file.
     bool IsBuiltIn() const { return builtIn_; }
     void MarkBuiltIn() { builtIn_ = true; }
+    bool IsRenamed() const { return renamed_; }
     // Identity and mark of a built-in definition. The name is ASCII and outlives all models.
     void SetBuiltInIdentity(const GUID& id, const char* name);
 
@@ -49,6 +50,7 @@ private:
     bool described_ = false;
     bool initialized_ = false;
     bool builtIn_ = false;
+    bool renamed_ = false;
 };
 
 }  // namespace aaf

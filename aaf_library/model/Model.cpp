@@ -203,6 +203,23 @@ TypeDefinition* Model::FindType(const GUID& id) {
     return entry == nullptr ? nullptr : &Enter(MakeBuiltInType(*this, *entry));
 }
 
+bool Model::HasAsBuiltIn(const BuiltInClass& entry) const {
+    // Numbers of the file's own are not in the built-in model.
+    for (const BuiltInProperty& property : entry.properties) {
+        if (property.key.pid == kNoPropertyId) {
+            return false;
+        }
+    }
+    const auto found = classById_.find(entry.id);
+    return found == classById_.end() || found->second->IsAsBuiltIn();
+}
+
+bool Model::HasAsBuiltIn(const BuiltInType& entry) const {
+    const auto found = typeById_.find(entry.id);
+    return found == typeById_.end() || (found->second->IsBuiltIn() && !found->second->IsRenamed() &&
+                                        MembersOf(*found->second) == FactsOf(entry).members);
+}
+
 HRESULT Model::RegisterClass(ClassDefinition& definition) {
     if (!definition.IsInitialized()) {
         return AAFRESULT_NOT_INITIALIZED;

@@ -60,6 +60,13 @@ public:
     // which they came into being.
     const std::vector<RefPtr<ClassDefinition>>& classes();
     const std::vector<RefPtr<TypeDefinition>>& types();
+    // Those that came into being so far; all that are not built in are among them.
+    const std::vector<RefPtr<ClassDefinition>>& madeClasses() const { return classes_; }
+    const std::vector<RefPtr<TypeDefinition>>& madeTypes() const { return types_; }
+    // Whether its definition says nothing else than the built-in model, or would when it came into
+    // being.
+    bool HasAsBuiltIn(const BuiltInClass& entry) const;
+    bool HasAsBuiltIn(const BuiltInType& entry) const;
     // Adds a definition that a caller made; one whose id exists stays outside, silently for types.
     HRESULT RegisterClass(ClassDefinition& definition);
     HRESULT RegisterType(TypeDefinition& type);

@@ -85,6 +85,8 @@ public:
         Complete();
         return values_;
     }
+    // The same, without those that come into being when they are wanted.
+    const Values& MadeValues() const { return values_; }
     PropertyValue* FindValue(const PropertyKey& key) const;
     bool IsPresent(const PropertyKey& key) const { return FindValue(key) != nullptr; }
     // Drops a value; absent: AAFRESULT_PROP_NOT_PRESENT.

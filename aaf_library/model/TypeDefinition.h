@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <algorithm>
 #include <memory>
 #include <vector>
 
@@ -32,6 +33,10 @@ struct TypeMember {
     GUID id{};  // record: type of the member; extendible enumeration: value; weak reference:
                 // property on the path from the root to the set of targets
     aafInt64 value = 0;  // enumeration: value
+
+    bool operator==(const TypeMember& other) const {
+        return name == other.name && id == other.id && value == other.value;
+    }
 };
 
 // The parts of a type in order. Copies share them until one is added to: those of a built-in type
@@ -51,6 +56,9 @@ public:
         std::vector<TypeMember> longer(begin(), end());
         longer.push_back(std::move(member));
         *this = std::move(longer);
+    }
+    bool operator==(const TypeMembers& other) const {
+        return members_ == other.members_ || std::equal(begin(), end(), other.begin(), other.end());
     }
 
 private:

@@ -120,6 +120,22 @@ HRESULT Setup(TypeDefinition& type, Model& model, const TypeFacts& facts) {
     }
 }
 
+std::vector<TypeFacts> AllBuiltInFacts() {
+    std::vector<TypeFacts> all;
+    all.reserve(BuiltInTypes().size());
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        std::vector<TypeMember> members;
+        for (const BuiltInMember& member : entry.members) {
+            members.push_back({Widen(member.name), member.id, member.value});
+        }
+        all.push_back({entry.id, Widen(entry.name), entry.kind, entry.target, entry.size,
+                       entry.isSigned, std::move(members)});
+    }
+    return all;
+}
+
+}  // namespace
+
 TypeMembers MembersOf(const TypeDefinition& type) {
     switch (type.kind()) {
         case TypeKind::Enumeration:
@@ -140,21 +156,11 @@ TypeMembers MembersOf(const TypeDefinition& type) {
     }
 }
 
-std::vector<TypeFacts> AllBuiltInFacts() {
-    std::vector<TypeFacts> all;
-    all.reserve(BuiltInTypes().size());
-    for (const BuiltInType& entry : BuiltInTypes()) {
-        std::vector<TypeMember> members;
-        for (const BuiltInMember& member : entry.members) {
-            members.push_back({Widen(member.name), member.id, member.value});
-        }
-        all.push_back({entry.id, Widen(entry.name), entry.kind, entry.target, entry.size,
-                       entry.isSigned, std::move(members)});
-    }
-    return all;
+bool operator==(const TypeFacts& left, const TypeFacts& right) {
+    return left.id == right.id && left.name == right.name && left.kind == right.kind &&
+           left.target == right.target && left.size == right.size &&
+           left.isSigned == right.isSigned && left.members == right.members;
 }
-
-}  // namespace
 
 const TypeFacts& FactsOf(const BuiltInType& entry) {
     static const std::vector<TypeFacts> all = AllBuiltInFacts();

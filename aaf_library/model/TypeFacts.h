@@ -20,9 +20,12 @@ struct TypeFacts {
     TypeMembers members;
 };
 
+bool operator==(const TypeFacts& left, const TypeFacts& right);
+
 // Those of a built-in type are the same object for the whole process.
 const TypeFacts& FactsOf(const BuiltInType& entry);
 TypeFacts FactsOf(const TypeDefinition& type);
+TypeMembers MembersOf(const TypeDefinition& type);
 
 // References name a class; all other targets are types.
 inline bool RefersToClass(TypeKind kind) {

@@ -14,7 +14,7 @@ namespace aaf {
 // file between.
 HRESULT CopyExtensions(Model& source, Model& target) {
     try {
-        stored::MetaClosure closure(source);
+        stored::MetaClosure closure(source, stored::MetaClosure::BuiltIn::LeftOut);
         closure.AddExtensions();
         const stored::MetaRegistration registration(closure.records(), target);
         return AAFRESULT_SUCCESS;

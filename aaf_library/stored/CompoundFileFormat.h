@@ -27,21 +27,57 @@ inline constexpr std::uint8_t kCompoundMagic[8] = {0xD0, 0xCF, 0x11, 0xE0, 0xA1,
 
 inline constexpr std::size_t kHeaderSize = 512;
 inline constexpr std::size_t kSignatureOffset = 8;
+inline constexpr std::size_t kMinorVersionOffset = 24;
+inline constexpr std::size_t kMajorVersionOffset = 26;
+inline constexpr std::size_t kByteOrderOffset = 28;
 inline constexpr std::size_t kSectorShiftOffset = 30;
+inline constexpr std::size_t kSmallSectorShiftOffset = 32;
+inline constexpr std::size_t kDirectoryCountOffset = 40;
 inline constexpr std::size_t kTableCountOffset = 44;
 inline constexpr std::size_t kFirstDirectoryOffset = 48;
 inline constexpr std::size_t kSmallLimitOffset = 56;
 inline constexpr std::size_t kFirstSmallTableOffset = 60;
+inline constexpr std::size_t kSmallTableCountOffset = 64;
 inline constexpr std::size_t kFirstTableListOffset = 68;
+inline constexpr std::size_t kTableListCountOffset = 72;
 inline constexpr std::size_t kTableListOffset = 76;
 inline constexpr std::uint32_t kHeaderTableCount = 109;
 
-inline constexpr std::size_t kDirectoryEntrySize = 128;
-inline constexpr std::uint32_t kSmallSectorSize = 64;
+inline constexpr std::uint16_t kMinorVersion = 0x3E;
+inline constexpr std::uint16_t kByteOrderMark = 0xFFFE;
+inline constexpr std::uint16_t kSmallSectorShift = 6;
+inline constexpr std::uint32_t kSmallSectorSize = 1u << kSmallSectorShift;
 inline constexpr std::uint32_t kSmallStreamLimit = 4096;
+
+// A directory entry: its name with a terminator, then
+//
+//   offset 64  u16       size of the name in bytes, terminator included
+//          66  u8        kind, u8 colour in the search tree of its storage
+//          68  u32       left neighbour, u32 right one, u32 first contained entry
+//          80  16        class id
+//          96  20        flags and times, which AAF leaves empty
+//         116  u32       first sector
+//         120  u64       size of the content
+inline constexpr std::size_t kDirectoryEntrySize = 128;
+inline constexpr std::size_t kEntryNameSizeOffset = 64;
+inline constexpr std::size_t kEntryKindOffset = 66;
+inline constexpr std::size_t kEntryColourOffset = 67;
+inline constexpr std::size_t kEntryLeftOffset = 68;
+inline constexpr std::size_t kEntryRightOffset = 72;
+inline constexpr std::size_t kEntryChildOffset = 76;
+inline constexpr std::size_t kEntryClassOffset = 80;
+inline constexpr std::size_t kEntryStartOffset = 116;
+inline constexpr std::size_t kEntrySizeOffset = 120;
+inline constexpr std::size_t kLongestName = 31;
+
+enum class EntryKind : std::uint8_t { Unused = 0, Storage = 1, Stream = 2, Root = 5 };
+inline constexpr std::uint8_t kBlack = 1;
+inline constexpr std::uint32_t kNoEntry = 0xFFFFFFFF;
 
 inline constexpr std::uint32_t kFreeSector = 0xFFFFFFFF;
 inline constexpr std::uint32_t kEndOfChain = 0xFFFFFFFE;
+inline constexpr std::uint32_t kTableSector = 0xFFFFFFFD;
+inline constexpr std::uint32_t kTableListSector = 0xFFFFFFFC;
 inline constexpr std::uint32_t kLastPlainSector = 0xFFFFFFFA;
 
 // The two kinds of AAF file differ in the size of their sectors.

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/CompoundFileReader.h"
 
-#include "aaf_library/stored/CompoundFileFormat.h"
 #include "aaf_library/stored/LittleEndian.h"
 
 #include <algorithm>
@@ -11,7 +10,7 @@ namespace aaf::stored {
 
 namespace {
 
-constexpr std::size_t kLongestNameBytes = 64;  // with the terminator
+constexpr std::size_t kLongestNameBytes = 2 * (kLongestName + 1);  // with the terminator
 
 std::uint32_t NumberIn(const std::uint8_t* bytes) {
     return ByteReader(bytes, 4).TakeNumber<std::uint32_t>();
@@ -57,12 +56,11 @@ void CompoundFileReader::ReadHeader() {
         throw StoredError("is no compound file");
     }
     std::copy_n(file_.begin() + kSignatureOffset, signature_.size(), signature_.begin());
-    ByteReader from(file_.data() + kSectorShiftOffset - 2, 6);
+    ByteReader from(file_.data() + kByteOrderOffset, 6);
     const auto order = from.TakeNumber<std::uint16_t>();
     const auto shift = from.TakeNumber<std::uint16_t>();
     const auto smallShift = from.TakeNumber<std::uint16_t>();
-    if (order != 0xFFFE || (shift != 9 && shift != 12) ||
-        1u << smallShift % 32 != kSmallSectorSize ||
+    if (order != kByteOrderMark || (shift != 9 && shift != 12) || smallShift != kSmallSectorShift ||
         HeaderNumber(kSmallLimitOffset) != kSmallStreamLimit) {
         throw StoredError("a kind of compound file that AAF does not use");
     }

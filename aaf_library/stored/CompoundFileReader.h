@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/stored/CompoundFileFormat.h"
 #include "aaf_library/stored/StoredTree.h"
 
 #include <map>
@@ -16,7 +17,7 @@ namespace aaf::stored {
 // tables are twisted, and no walk recurses. Throws StoredError.
 class CompoundFileReader {
 public:
-    enum class Kind : std::uint8_t { Unused = 0, Storage = 1, Stream = 2, Root = 5 };
+    using Kind = EntryKind;
 
     struct Entry {
         std::u16string name;

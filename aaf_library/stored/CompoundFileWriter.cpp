@@ -2,117 +2,279 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/CompoundFileWriter.h"
 
-#include "aaf_library/stored/CompoundFileFormat.h"
 #include "aaf_library/stored/LittleEndian.h"
+#include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/StoredNames.h"
+#include "aaf_library/stored/UpperCase.h"
 
-#include <gsf/gsf-outfile-msole.h>
-#include <gsf/gsf-output-memory.h>
 #include <algorithm>
+#include <numeric>
+#include <string_view>
+#include <tuple>
+#include <utility>
 
 namespace aaf::stored {
 
 namespace {
 
-constexpr std::size_t kLongestName = 31;
+constexpr std::u16string_view kNoNameHas{u"/\\:!\0", 5};
 
-// libgsf takes any name and writes a broken entry for one that does not fit.
-std::string CheckedName(const std::u16string& name) {
+void CheckName(const std::u16string& name) {
     if (name.empty() || name.size() > kLongestName ||
-        name.find_first_of(u"/\\:!") != std::u16string::npos) {
+        name.find_first_of(kNoNameHas) != std::u16string::npos) {
         throw StoredError("\"" + ToUtf8(name) + "\" cannot be the name of a storage or stream");
     }
-    return ToUtf8(name);
 }
 
-std::uint32_t NumberAt(const Bytes& file, std::size_t offset) {
-    return ByteReader(file.data() + offset, 4).TakeNumber<std::uint32_t>();
+std::uint32_t NumberIn(const std::uint8_t* at) {
+    return at[0] | at[1] << 8 | at[2] << 16 | std::uint32_t{at[3]} << 24;
 }
 
-// In a large file with large sectors libgsf can name an allocation table
-// sector that it did not write; it would begin where the file ends. A sector
-// of free entries is what is missing.
-void AppendMissingTable(Bytes& file, std::size_t sector) {
-    std::size_t last = 0;
-    const std::uint32_t count = std::min(NumberAt(file, kTableCountOffset), kHeaderTableCount);
-    for (std::uint32_t i = 0; i < count; ++i) {
-        last = std::max<std::size_t>(last, NumberAt(file, kTableListOffset + 4 * i));
+Bytes NumberBytes(const std::vector<std::uint32_t>& numbers) {
+    Bytes bytes(numbers.size() * 4);
+    std::uint8_t* at = bytes.data();
+    for (std::uint32_t number : numbers) {
+        PutNumber(at, number);
+        at += 4;
     }
-    if (file.size() < (last + 2) * sector) {
-        file.resize((last + 2) * sector, 0xFF);
+    return bytes;
+}
+
+std::size_t CountOf(std::size_t size, std::size_t part) {
+    return (size + part - 1) / part;
+}
+
+// The entries of a run that begins behind the last one.
+void AppendRun(std::vector<std::uint32_t>& table, std::size_t count) {
+    for (std::size_t i = 1; i < count; ++i) {
+        table.push_back(static_cast<std::uint32_t>(table.size() + 1));
     }
+    table.push_back(kEndOfChain);
+}
+
+void FillUp(std::vector<std::uint32_t>& numbers, std::size_t perSector) {
+    numbers.resize(CountOf(numbers.size(), perSector) * perSector, kFreeSector);
 }
 
 }  // namespace
 
-StorageWriter::StorageWriter(StorageWriter&& other) noexcept : storage_(other.storage_) {
-    other.storage_ = nullptr;
-}
-
-StorageWriter::~StorageWriter() {
-    if (storage_ == nullptr) {
-        return;
-    }
-    if (!gsf_output_is_closed(GSF_OUTPUT(storage_))) {
-        gsf_output_close(GSF_OUTPUT(storage_));
-    }
-    g_object_unref(storage_);
-}
-
-void StorageWriter::SetClass(const StoredAuid& classId) {
-    if (!gsf_outfile_msole_set_class_id(GSF_OUTFILE_MSOLE(storage_), classId.data())) {
-        throw StoredError("a class id cannot be set");
-    }
-}
-
-void StorageWriter::stream(const std::u16string& name, const Bytes& content) {
-    GsfOutput* stream = gsf_outfile_new_child(storage_, CheckedName(name).c_str(), FALSE);
-    if (stream == nullptr) {
-        throw StoredError("the stream \"" + ToUtf8(name) + "\" cannot be made");
-    }
-    const bool written = gsf_output_write(stream, content.size(), content.data());
-    const bool closed = gsf_output_close(stream);
-    g_object_unref(stream);
-    if (!written || !closed) {
-        throw StoredError("the stream \"" + ToUtf8(name) + "\" cannot be written");
-    }
-}
-
-StorageWriter StorageWriter::storage(const std::u16string& name) {
-    GsfOutput* storage = gsf_outfile_new_child(storage_, CheckedName(name).c_str(), TRUE);
-    if (storage == nullptr) {
-        throw StoredError("the storage \"" + ToUtf8(name) + "\" cannot be made");
-    }
-    return StorageWriter(GSF_OUTFILE(storage));
-}
-
-void StorageWriter::Close() {
-    if (!gsf_output_close(GSF_OUTPUT(storage_))) {
-        throw StoredError("a storage cannot be closed");
-    }
-}
-
 CompoundFileWriter::CompoundFileWriter(SectorSize sectorSize)
-    : sectorSize_(sectorSize), sink_(gsf_output_memory_new()) {
-    GsfOutfile* file = gsf_outfile_msole_new_full(sink_, static_cast<guint>(sectorSize),
-                                                  static_cast<guint>(kSmallSectorSize));
-    root_.reset(new StorageWriter(file));
+    : sectorSize_(static_cast<std::size_t>(sectorSize)),
+      large_(sectorSize == SectorSize::Bytes4096),
+      file_(sectorSize_) {
+    std::uint8_t* const header = file_.data();
+    std::copy(std::begin(kCompoundMagic), std::end(kCompoundMagic), header);
+    const StoredAuid& signature = large_ ? kSignature4096 : kSignature512;
+    std::copy(signature.begin(), signature.end(), header + kSignatureOffset);
+    PutNumber(header + kMinorVersionOffset, kMinorVersion);
+    PutNumber(header + kMajorVersionOffset, std::uint16_t(large_ ? 4 : 3));
+    PutNumber(header + kByteOrderOffset, kByteOrderMark);
+    PutNumber(header + kSectorShiftOffset, std::uint16_t(large_ ? 12 : 9));
+    PutNumber(header + kSmallSectorShiftOffset, kSmallSectorShift);
+    SetHeader(kSmallLimitOffset, kSmallStreamLimit);
+    AddEntry(kRoot, u"Root Entry", EntryKind::Root);
 }
 
-CompoundFileWriter::~CompoundFileWriter() {
-    root_.reset();
-    g_object_unref(sink_);
+void CompoundFileWriter::SetClass(Storage storage, const StoredAuid& classId) {
+    std::copy(classId.begin(), classId.end(), EntryAt(storage) + kEntryClassOffset);
+}
+
+CompoundFileWriter::Storage CompoundFileWriter::AddStorage(Storage holder,
+                                                           const std::u16string& name) {
+    return AddEntry(holder, name, EntryKind::Storage);
+}
+
+void CompoundFileWriter::AddStream(Storage holder, const std::u16string& name,
+                                   const Bytes& content) {
+    const std::uint32_t index = AddEntry(holder, name, EntryKind::Stream);
+    if (!content.empty()) {
+        const bool small = content.size() < kSmallStreamLimit;
+        SetContent(index, small ? AppendSmallSectors(content) : AppendSectors(content),
+                   content.size());
+    }
+}
+
+void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
+                                 const CompoundPart& part) {
+    const Storage storage = AddEntry(holder, name, EntryKind::Storage);
+    const auto sectorsBefore = static_cast<std::uint32_t>(smallTable_.size());
+    if (part.directory.size() > directory_.size()) {
+        // Leaves room for what follows the large part of a file.
+        directory_.reserve(part.directory.size() * 3 / 2);
+        small_.reserve(small_.size() + part.small.size() * 3 / 2);
+    }
+    // Its root becomes this storage, and its other entries stand behind it.
+    directory_.insert(directory_.end(), part.directory.begin() + kDirectoryEntrySize,
+                      part.directory.end());
+    const std::uint8_t* const root = part.directory.data();
+    std::copy_n(root + kEntryClassOffset, sizeof(StoredAuid), EntryAt(storage) + kEntryClassOffset);
+    std::copy_n(root + kEntryChildOffset, 4, EntryAt(storage) + kEntryChildOffset);
+    const auto moveBy = [](std::uint8_t* at, std::uint32_t distance) {
+        const std::uint32_t number = NumberIn(at);
+        PutNumber(at, number > kLastPlainSector ? number : number + distance);
+    };
+    for (std::size_t at = storage * kDirectoryEntrySize; at < directory_.size();
+         at += kDirectoryEntrySize) {
+        std::uint8_t* const entry = directory_.data() + at;
+        moveBy(entry + kEntryRightOffset, storage);
+        moveBy(entry + kEntryChildOffset, storage);
+        moveBy(entry + kEntryStartOffset, sectorsBefore);
+    }
+    small_.insert(small_.end(), part.small.begin(), part.small.end());
+    for (std::uint32_t next : part.smallTable) {
+        smallTable_.push_back(next > kLastPlainSector ? next : next + sectorsBefore);
+    }
+}
+
+std::optional<CompoundPart> CompoundFileWriter::FinishPart() {
+    if (!table_.empty()) {
+        return std::nullopt;
+    }
+    LinkSiblings();
+    return CompoundPart{std::move(directory_), std::move(small_), std::move(smallTable_)};
 }
 
 Bytes CompoundFileWriter::Finish() {
-    root_->Close();
-    const guint8* bytes = gsf_output_memory_get_bytes(GSF_OUTPUT_MEMORY(sink_));
-    Bytes file(bytes, bytes + gsf_output_size(sink_));
-    const bool small = sectorSize_ == SectorSize::Bytes512;
-    const StoredAuid& signature = small ? kSignature512 : kSignature4096;
-    std::copy(signature.begin(), signature.end(), file.begin() + kSignatureOffset);
-    AppendMissingTable(file, static_cast<std::size_t>(sectorSize_));
-    return file;
+    LinkSiblings();
+    // Room for all that follows but the table of a file of megabytes.
+    file_.reserve(file_.size() + small_.size() + small_.size() / 16 + directory_.size() +
+                  8 * sectorSize_);
+    if (!small_.empty()) {
+        SetContent(kRoot, AppendSectors(small_), small_.size());
+    }
+    AppendSmallTable();
+    SetHeader(kFirstDirectoryOffset, AppendSectors(directory_));
+    SetHeader(kDirectoryCountOffset, large_ ? CountOf(directory_.size(), sectorSize_) : 0);
+    AppendTable();
+    return std::move(file_);
+}
+
+std::uint32_t CompoundFileWriter::AddEntry(Storage holder, const std::u16string& name,
+                                           EntryKind kind) {
+    CheckName(name);
+    const auto index = static_cast<std::uint32_t>(directory_.size() / kDirectoryEntrySize);
+    Place& place = places_.emplace_back();
+    place.holder = holder;
+    place.length = name.size();
+    std::transform(name.begin(), name.end(), place.name.begin(), UpperCase);
+    place.index = index;
+
+    directory_.resize(directory_.size() + kDirectoryEntrySize);
+    std::uint8_t* const entry = EntryAt(index);
+    for (std::size_t i = 0; i < name.size(); ++i) {
+        PutNumber(entry + 2 * i, name[i]);
+    }
+    PutNumber(entry + kEntryNameSizeOffset, static_cast<std::uint16_t>(2 * name.size() + 2));
+    PutNumber(entry + kEntryKindOffset, static_cast<std::uint8_t>(kind));
+    PutNumber(entry + kEntryColourOffset, kBlack);
+    for (std::size_t link : {kEntryLeftOffset, kEntryRightOffset, kEntryChildOffset}) {
+        PutNumber(entry + link, kNoEntry);
+    }
+    SetContent(index, kEndOfChain, 0);
+    return index;
+}
+
+std::uint8_t* CompoundFileWriter::EntryAt(std::uint32_t index) {
+    return directory_.data() + index * kDirectoryEntrySize;
+}
+
+void CompoundFileWriter::SetContent(std::uint32_t index, std::uint32_t start, std::size_t size) {
+    PutNumber(EntryAt(index) + kEntryStartOffset, start);
+    PutNumber(EntryAt(index) + kEntrySizeOffset, std::uint64_t{size});
+}
+
+void CompoundFileWriter::SetHeader(std::size_t offset, std::size_t value) {
+    PutNumber(file_.data() + offset, static_cast<std::uint32_t>(value));
+}
+
+// The entries of a storage are a search tree by length of name, then by its
+// text in upper case. Each is the right neighbour of the one before and all
+// are black: the simplest tree that the format allows.
+void CompoundFileWriter::LinkSiblings() {
+    const auto order = [](const Place& place) {
+        return std::tie(place.holder, place.length, place.name);
+    };
+    std::sort(places_.begin() + 1, places_.end(),
+              [&](const Place& left, const Place& right) { return order(left) < order(right); });
+    for (std::size_t i = 1; i < places_.size(); ++i) {
+        const Place& place = places_[i];
+        const Place& before = places_[i - 1];
+        const bool first = i == 1 || before.holder != place.holder;
+        if (!first && order(before) == order(place)) {
+            throw StoredError("\"" + ToUtf8({place.name.data(), place.length}) +
+                              "\" is twice in one storage");
+        }
+        PutNumber(first ? EntryAt(place.holder) + kEntryChildOffset
+                        : EntryAt(before.index) + kEntryRightOffset,
+                  place.index);
+    }
+}
+
+// Gives the number of the first sector.
+std::uint32_t CompoundFileWriter::AppendSectors(const Bytes& content) {
+    const auto first = static_cast<std::uint32_t>(table_.size());
+    AppendRun(table_, CountOf(content.size(), sectorSize_));
+    file_.insert(file_.end(), content.begin(), content.end());
+    file_.resize((table_.size() + 1) * sectorSize_);
+    return first;
+}
+
+std::uint32_t CompoundFileWriter::AppendSmallSectors(const Bytes& content) {
+    const auto first = static_cast<std::uint32_t>(smallTable_.size());
+    AppendRun(smallTable_, CountOf(content.size(), kSmallSectorSize));
+    small_.insert(small_.end(), content.begin(), content.end());
+    small_.resize(smallTable_.size() * kSmallSectorSize);
+    return first;
+}
+
+void CompoundFileWriter::AppendSmallTable() {
+    FillUp(smallTable_, sectorSize_ / 4);
+    const Bytes table = NumberBytes(smallTable_);
+    SetHeader(kFirstSmallTableOffset, table.empty() ? kEndOfChain : AppendSectors(table));
+    SetHeader(kSmallTableCountOffset, table.size() / sectorSize_);
+}
+
+// The table has entries for its own sectors, too, and for those of the list
+// that goes on where the header's list of its sectors is full.
+void CompoundFileWriter::AppendTable() {
+    const std::size_t perSector = sectorSize_ / 4;
+    const std::size_t used = table_.size();
+    std::size_t tables = 0;
+    std::size_t lists = 0;
+    for (std::size_t wanted = 1; tables < wanted;) {
+        tables = wanted;
+        lists = CountOf(tables - std::min<std::size_t>(tables, kHeaderTableCount), perSector - 1);
+        wanted = CountOf(used + tables + lists, perSector);
+    }
+    table_.insert(table_.end(), tables, kTableSector);
+    table_.insert(table_.end(), lists, kTableListSector);
+    FillUp(table_, perSector);
+    std::vector<std::uint32_t> list(kHeaderTableCount + lists * perSector, kFreeSector);
+    std::size_t at = 0;
+    for (std::size_t i = 0; i < tables; ++i) {
+        list[at] = static_cast<std::uint32_t>(used + i);
+        ++at;
+        // The last number of a sector of the list leads to the next one.
+        if (at > kHeaderTableCount && (at - kHeaderTableCount) % perSector == perSector - 1) {
+            const std::size_t next = used + tables + (at - kHeaderTableCount) / perSector + 1;
+            list[at] = static_cast<std::uint32_t>(next);
+            ++at;
+        }
+    }
+    if (lists > 0) {
+        list.back() = kEndOfChain;
+    }
+    SetHeader(kTableCountOffset, tables);
+    SetHeader(kFirstTableListOffset, lists == 0 ? kEndOfChain : used + tables);
+    SetHeader(kTableListCountOffset, lists);
+
+    const Bytes table = NumberBytes(table_);
+    const Bytes listed = NumberBytes(list);
+    const auto behindHeader = listed.begin() + kHeaderTableCount * 4;
+    std::copy(listed.begin(), behindHeader, file_.begin() + kTableListOffset);
+    file_.reserve(file_.size() + table.size() + listed.size());
+    file_.insert(file_.end(), table.begin(), table.end());
+    file_.insert(file_.end(), behindHeader, listed.end());
 }
 
 }  // namespace aaf::stored

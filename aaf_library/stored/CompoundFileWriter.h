@@ -2,55 +2,75 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/stored/CompoundFileFormat.h"
 #include "aaf_library/stored/StoredTree.h"
 
-#include <memory>
+#include <array>
+#include <optional>
 #include <string>
-
-typedef struct _GsfOutfile GsfOutfile;
-typedef struct _GsfOutput GsfOutput;
+#include <vector>
 
 namespace aaf::stored {
 
-// One storage of a compound file that is being written. Storages and streams
-// are written one at a time: a contained storage has to be closed before its
-// holder gets anything else. Throws StoredError.
-class StorageWriter {
-public:
-    StorageWriter(StorageWriter&& other) noexcept;
-    StorageWriter& operator=(StorageWriter&&) = delete;
-    StorageWriter(const StorageWriter&) = delete;
-    ~StorageWriter();
-
-    void SetClass(const StoredAuid& classId);
-    void stream(const std::u16string& name, const Bytes& content);
-    StorageWriter storage(const std::u16string& name);
-    void Close();
-
-private:
-    friend class CompoundFileWriter;
-    explicit StorageWriter(GsfOutfile* storage) : storage_(storage) {}
-
-    GsfOutfile* storage_;
+// A storage with all that it contains, short streams alone, to be put into any file. Its entries
+// and sectors count from nought.
+struct CompoundPart {
+    Bytes directory;
+    Bytes small;
+    std::vector<std::uint32_t> smallTable;
 };
 
-// A compound file that comes to be in memory.
+// Lays a compound file out in memory. Its sectors come in this order: long
+// streams as they are added, the short streams as one and their table, the
+// directory, the allocation table, the list of its sectors.
+// The same calls give the same bytes. Throws StoredError.
 class CompoundFileWriter {
 public:
+    // A storage by the number of its directory entry.
+    using Storage = std::uint32_t;
+    static constexpr Storage kRoot = 0;
+
     explicit CompoundFileWriter(SectorSize sectorSize);
-    CompoundFileWriter(const CompoundFileWriter&) = delete;
-    CompoundFileWriter& operator=(const CompoundFileWriter&) = delete;
-    ~CompoundFileWriter();
 
-    StorageWriter& root() { return *root_; }
+    void SetClass(Storage storage, const StoredAuid& classId);
+    Storage AddStorage(Storage holder, const std::u16string& name);
+    void AddStream(Storage holder, const std::u16string& name, const Bytes& content);
 
-    // Closes the root and gives the whole file, signature included.
+    // A copy of the part, under a name of its own.
+    void AddPart(Storage holder, const std::u16string& name, const CompoundPart& part);
+
+    // Gives the whole file, signature included; once.
     Bytes Finish();
+    // Or the root as a part; none when it holds a long stream.
+    std::optional<CompoundPart> FinishPart();
 
 private:
-    SectorSize sectorSize_;
-    GsfOutput* sink_;
-    std::unique_ptr<StorageWriter> root_;
+    // A directory entry among those of its storage.
+    struct Place {
+        Storage holder = kRoot;
+        std::size_t length = 0;
+        std::array<char16_t, kLongestName> name{};  // in upper case
+        std::uint32_t index = 0;
+    };
+
+    std::uint32_t AddEntry(Storage holder, const std::u16string& name, EntryKind kind);
+    std::uint8_t* EntryAt(std::uint32_t index);
+    void SetContent(std::uint32_t index, std::uint32_t start, std::size_t size);
+    void SetHeader(std::size_t offset, std::size_t value);
+    std::uint32_t AppendSectors(const Bytes& content);
+    std::uint32_t AppendSmallSectors(const Bytes& content);
+    void LinkSiblings();
+    void AppendSmallTable();
+    void AppendTable();
+
+    const std::size_t sectorSize_;
+    const bool large_;
+    Bytes file_;
+    std::vector<std::uint32_t> table_;  // the sector after each sector
+    Bytes small_;                       // the short streams
+    std::vector<std::uint32_t> smallTable_;
+    Bytes directory_;
+    std::vector<Place> places_;
 };
 
 }  // namespace aaf::stored

@@ -6,18 +6,28 @@
 #include "aaf_library/stored/StoredTree.h"
 
 #include <cstddef>
+#include <iterator>
 #include <string>
 
 namespace aaf::stored {
 
+template <typename Number>
+void PutNumber(std::uint8_t* at, Number value) {
+    for (std::size_t i = 0; i < sizeof(Number); ++i) {
+        at[i] = static_cast<std::uint8_t>(static_cast<std::uint64_t>(value) >> 8 * i);
+    }
+}
+
 // Appends numbers to bytes, little-endian and without padding.
 class ByteWriter {
 public:
+    ByteWriter() { bytes_.reserve(64); }  // most values are shorter
+
     template <typename Number>
     ByteWriter& AppendNumber(Number value) {
-        for (std::size_t i = 0; i < sizeof(Number); ++i) {
-            bytes_.push_back(static_cast<std::uint8_t>(static_cast<std::uint64_t>(value) >> 8 * i));
-        }
+        std::uint8_t bytes[sizeof(Number)];
+        PutNumber(bytes, value);
+        bytes_.insert(bytes_.end(), std::begin(bytes), std::end(bytes));
         return *this;
     }
     template <typename Range>

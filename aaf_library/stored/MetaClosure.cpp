@@ -57,14 +57,14 @@ void MetaClosure::AddMetaClasses() {
 
 void MetaClosure::AddExtensions() {
     // Entering a definition may look up others, which makes the lists longer.
-    for (std::size_t i = 0; i < model_.classes().size(); ++i) {
-        const RefPtr<ClassDefinition> definition = model_.classes()[i];
+    for (std::size_t i = 0; i < model_.madeClasses().size(); ++i) {
+        const RefPtr<ClassDefinition> definition = model_.madeClasses()[i];
         if (definition->IsExtended()) {
             AddClass(definition->id());
         }
     }
-    for (std::size_t i = 0; i < model_.types().size(); ++i) {
-        const RefPtr<TypeDefinition> type = model_.types()[i];
+    for (std::size_t i = 0; i < model_.madeTypes().size(); ++i) {
+        const RefPtr<TypeDefinition> type = model_.madeTypes()[i];
         if (!type->IsBuiltIn()) {
             AddType(type->id());
         }
@@ -89,6 +89,18 @@ void MetaClosure::EnterClass(const GUID& id) {
     if (!classes_.insert(id).second) {
         return;
     }
+    const BuiltInClass* const entry = FindBuiltInClass(id);
+    if (entry != nullptr && model_.HasAsBuiltIn(*entry)) {
+        if (builtIn_ == BuiltIn::LeftOut) {
+            return;
+        }
+        records_.builtInClasses.push_back(entry);
+        pendingClasses_.push_back(entry->parent);
+        for (const BuiltInProperty& property : entry->properties) {
+            pendingTypes_.push_back(property.type);
+        }
+        return;
+    }
     ClassDefinition* definition = model_.FindClass(id);
     if (definition == nullptr) {
         throw StoredError("a class that is needed has no definition");
@@ -105,12 +117,24 @@ void MetaClosure::EnterType(const GUID& id) {
     if (!types_.insert(id).second) {
         return;
     }
+    const BuiltInType* const entry = FindBuiltInType(id);
+    if (entry != nullptr && model_.HasAsBuiltIn(*entry)) {
+        if (builtIn_ == BuiltIn::LeftOut) {
+            return;
+        }
+        records_.builtInTypes.push_back(entry);
+        AddTypesIn(FactsOf(*entry));
+        return;
+    }
     const TypeDefinition* type = model_.FindType(id);
     if (type == nullptr) {
         throw StoredError("a type that is needed has no definition");
     }
     records_.types.push_back(FactsOf(*type));
-    const TypeFacts& record = records_.types.back();
+    AddTypesIn(records_.types.back());
+}
+
+void MetaClosure::AddTypesIn(const TypeFacts& record) {
     if (RefersToClass(record.kind)) {
         pendingClasses_.push_back(record.target);
     } else if (TargetPidOf(record.kind) != 0) {

@@ -17,7 +17,11 @@ namespace aaf::stored {
 // it is made of, so that no definition refers to one that is missing.
 class MetaClosure {
 public:
-    explicit MetaClosure(Model& model) : model_(model) {}
+    // What is as built in leads to nothing else: whoever knows it, too, may do without.
+    enum class BuiltIn { Gathered, LeftOut };
+
+    explicit MetaClosure(Model& model, BuiltIn builtIn = BuiltIn::Gathered)
+        : model_(model), builtIn_(builtIn) {}
 
     // Throw StoredError when the model has no such definition, or lacks one
     // that it needs.
@@ -35,8 +39,10 @@ private:
     void AddPending();
     void EnterClass(const GUID& id);
     void EnterType(const GUID& id);
+    void AddTypesIn(const TypeFacts& type);
 
     Model& model_;
+    const BuiltIn builtIn_;
     MetaRecords records_;
     std::unordered_set<GUID, GuidHash> classes_;
     std::unordered_set<GUID, GuidHash> types_;

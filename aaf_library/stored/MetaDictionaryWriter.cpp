@@ -1,9 +1,17 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "aaf_library/model/BuiltIn.h"
+#include "aaf_library/model/Text.h"
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/MetaKinds.h"
 #include "aaf_library/stored/ModelNames.h"
+#include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
+
+#include <algorithm>
+#include <deque>
+#include <memory>
+#include <mutex>
 
 namespace aaf::stored {
 
@@ -166,21 +174,111 @@ StoredObject StoredType(const TypeFacts& record) {
     return definition.Take();
 }
 
-}  // namespace
+StoredObject StoredBuiltInClass(const BuiltInClass& entry) {
+    MetaClass record{entry.id, Widen(entry.name), entry.parent, entry.concrete, {}};
+    for (const BuiltInProperty& property : entry.properties) {
+        record.properties.push_back({property.key.id, Widen(property.name), property.key.pid,
+                                     property.type, property.optional, property.unique});
+    }
+    return StoredClass(record);
+}
 
-StoredObject StoredMetaDictionary(const MetaRecords& records) {
+StoredObject StoredBuiltInType(const BuiltInType& entry) {
+    return StoredType(FactsOf(entry));
+}
+
+// The definitions of a built-in table, each laid out when a file first needs it.
+template <class Entry>
+class LaidOutTable {
+public:
+    LaidOutTable(Span<Entry> table, StoredObject (*makeWhole)(const Entry&))
+        : table_(table), makeWhole_(makeWhole), places_(new Place[table.size()]) {}
+
+    const StoredObject& Definition(const Entry& entry) {
+        Place& place = places_[static_cast<std::size_t>(&entry - table_.begin())];
+        std::call_once(place.once, [&] {
+            place.object = makeWhole_(entry);
+            if (auto laidOut = LayOut(place.object, {kClassPath, kTypePath})) {
+                place.object.properties.resize(1);  // the key in the set of definitions
+                place.object.laidOut = std::move(laidOut);
+            }
+        });
+        return place.object;
+    }
+
+private:
+    struct Place {
+        std::once_flag once;
+        StoredObject object;
+    };
+
+    const Span<Entry> table_;
+    StoredObject (*const makeWhole_)(const Entry&);
+    const std::unique_ptr<Place[]> places_;
+};
+
+StoredObject LaidOutClass(const BuiltInClass& entry) {
+    static LaidOutTable<BuiltInClass> table(BuiltInClasses(), StoredBuiltInClass);
+    return table.Definition(entry);
+}
+
+StoredObject LaidOutType(const BuiltInType& entry) {
+    static LaidOutTable<BuiltInType> table(BuiltInTypes(), StoredBuiltInType);
+    return table.Definition(entry);
+}
+
+StoredObject MetaDictionaryOf(const MetaRecords& records,
+                              StoredObject (*builtInClass)(const BuiltInClass&),
+                              StoredObject (*builtInType)(const BuiltInType&)) {
     StoredProperty classes = DefinitionSet(meta::kClassDefinitions, u"ClassDefinitions");
     for (const MetaClass& record : records.classes) {
         AddTo(classes, record.id, StoredClass(record));
+    }
+    for (const BuiltInClass* entry : records.builtInClasses) {
+        AddTo(classes, entry->id, builtInClass(*entry));
     }
     StoredProperty types = DefinitionSet(meta::kTypeDefinitions, u"TypeDefinitions");
     for (const TypeFacts& record : records.types) {
         AddTo(types, record.id, StoredType(record));
     }
+    for (const BuiltInType* entry : records.builtInTypes) {
+        AddTo(types, entry->id, builtInType(*entry));
+    }
     StoredObject dictionary;
     dictionary.classId = AuidOf(AUID_AAFMetaDictionary);
     dictionary.properties.push_back(std::move(classes));
     dictionary.properties.push_back(std::move(types));
+    return dictionary;
+}
+
+}  // namespace
+
+StoredObject StoredMetaDictionary(const MetaRecords& records) {
+    return MetaDictionaryOf(records, StoredBuiltInClass, StoredBuiltInType);
+}
+
+// Movies of one kind need the same definitions, so the last few dictionaries are kept.
+StoredObject LaidOutMetaDictionary(const MetaRecords& records) {
+    struct Known {
+        MetaRecords records;
+        StoredObject dictionary;
+    };
+    constexpr std::size_t most = 8;
+    static std::mutex mutex;
+    static std::deque<Known> lastOnes;
+    const std::lock_guard<std::mutex> lock(mutex);
+    const auto known = std::find_if(lastOnes.begin(), lastOnes.end(),
+                                    [&](const Known& one) { return one.records == records; });
+    if (known != lastOnes.end()) {
+        return known->dictionary;
+    }
+    StoredObject dictionary = MetaDictionaryOf(records, LaidOutClass, LaidOutType);
+    if (auto laidOut = LayOut(dictionary, {kClassPath, kTypePath})) {
+        dictionary.properties.clear();
+        dictionary.laidOut = std::move(laidOut);
+        lastOnes.push_front({records, dictionary});
+        lastOnes.resize(std::min(lastOnes.size(), most));
+    }
     return dictionary;
 }
 

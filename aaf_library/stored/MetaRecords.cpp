@@ -32,14 +32,27 @@ std::uint16_t TargetPidOf(TypeKind kind) {
     }
 }
 
+static bool operator==(const MetaProperty& left, const MetaProperty& right) {
+    return left.id == right.id && left.name == right.name && left.pid == right.pid &&
+           left.type == right.type && left.optional == right.optional &&
+           left.unique == right.unique;
+}
+
+static bool operator==(const MetaClass& left, const MetaClass& right) {
+    return left.id == right.id && left.name == right.name && left.parent == right.parent &&
+           left.concrete == right.concrete && left.properties == right.properties;
+}
+
+bool operator==(const MetaRecords& left, const MetaRecords& right) {
+    return left.classes == right.classes && left.types == right.types &&
+           left.builtInClasses == right.builtInClasses && left.builtInTypes == right.builtInTypes;
+}
+
 StoredAuid AuidOf(const GUID& id) {
-    const Bytes bytes = ByteWriter()
-                            .AppendNumber(static_cast<std::uint32_t>(id.Data1))
-                            .AppendNumber(static_cast<std::uint16_t>(id.Data2))
-                            .AppendNumber(static_cast<std::uint16_t>(id.Data3))
-                            .bytes();
     StoredAuid out;
-    std::copy(bytes.begin(), bytes.end(), out.begin());
+    PutNumber(out.data(), static_cast<std::uint32_t>(id.Data1));
+    PutNumber(out.data() + 4, static_cast<std::uint16_t>(id.Data2));
+    PutNumber(out.data() + 6, static_cast<std::uint16_t>(id.Data3));
     std::copy(std::begin(id.Data4), std::end(id.Data4), out.begin() + 8);
     return out;
 }

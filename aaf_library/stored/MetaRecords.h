@@ -35,10 +35,17 @@ struct MetaClass {
 struct MetaRecords {
     std::vector<MetaClass> classes;
     std::vector<TypeFacts> types;
+    // Those that say nothing else than the built-in model, where somebody cares.
+    std::vector<const BuiltInClass*> builtInClasses;
+    std::vector<const BuiltInType*> builtInTypes;
 };
+
+bool operator==(const MetaRecords& left, const MetaRecords& right);
 
 // The object that the root holds as its MetaDictionary.
 StoredObject StoredMetaDictionary(const MetaRecords& records);
+// The same for writing alone: what files have in common is laid out once.
+StoredObject LaidOutMetaDictionary(const MetaRecords& records);
 
 // Definitions of a kind that nobody knows are passed over. Throws StoredError.
 MetaRecords ReadMetaDictionary(const StoredObject& metaDictionary);

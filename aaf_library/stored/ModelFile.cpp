@@ -14,7 +14,7 @@ namespace aaf::stored {
 FileResult SaveModel(Model& model, Object& header, const std::filesystem::path& path,
                      SectorSize sectorSize) {
     try {
-        return SaveTree(TreeOfModel(model, header), path, sectorSize);
+        return SaveTree(TreeToWrite(model, header), path, sectorSize);
     } catch (const StoredError& problem) {
         return {FileFailure::NotStorable, path.u8string() + ": " + problem.what()};
     } catch (const std::bad_alloc&) {

@@ -5,18 +5,12 @@
 #include "aaf_library/model/Text.h"
 #include "aaf_library/model/TypeDefinition.h"
 #include "aaf_library/stored/LittleEndian.h"
+#include "text/Encodings.h"
 
 namespace aaf::stored {
 
 std::u16string Utf16Of(const std::wstring& text) {
-    Bytes stored;
-    AppendUtf16(text.data(), text.size(), stored);
-    ByteReader from(stored);
-    std::u16string out;
-    while (from.left() != 0) {
-        out += static_cast<char16_t>(from.TakeNumber<std::uint16_t>());
-    }
-    return out;
+    return encodings::ToUtf16Lossy(encodings::FromWide(text));
 }
 
 std::wstring WideOf(const std::u16string& text) {

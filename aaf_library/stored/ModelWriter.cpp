@@ -47,7 +47,10 @@ void SortByPid(StoredObject& object) {
 
 class ModelWriter {
 public:
-    explicit ModelWriter(Model& model) : model_(model), closure_(model) {}
+    using MetaDictionary = StoredObject (*)(const MetaRecords&);
+
+    ModelWriter(Model& model, MetaDictionary metaDictionary)
+        : model_(model), closure_(model), metaDictionary_(metaDictionary) {}
 
     StoredObject Write(Object& header) {
         StoredObject storedHeader = StoredObjectOf(header, prop::Header_Dictionary.pid);
@@ -60,7 +63,7 @@ public:
         StoredObject root;
         root.classId = kRootClassId;
         root.properties.push_back(ReferenceTo(meta::kRootMetaDictionary, u"MetaDictionary",
-                                              StoredMetaDictionary(closure_.records())));
+                                              metaDictionary_(closure_.records())));
         root.properties.push_back(
             ReferenceTo(meta::kRootHeader, u"Header", std::move(storedHeader)));
         return root;
@@ -82,6 +85,7 @@ private:
         StoredObject out;
         out.classId = AuidOf(from.classId());
         closure_.AddClass(from.classId());
+        out.properties.reserve(from.values().size() + 2);
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
                 out.properties.push_back(StoredPropertyOf(from, entry.first, *entry.second));
@@ -142,8 +146,10 @@ private:
     StoredProperty EmptyProperty(const PropertyDefinition& definition) {
         StoredProperty out;
         out.pid = definition.pid();
-        out.name = Utf16Of(definition.name());
         out.form = StoredFormOf(*definition.type());
+        if (out.form != StoredForm::Data && out.form != StoredForm::WeakReference) {
+            out.name = Utf16Of(definition.name());
+        }
         if (out.form == StoredForm::StrongSet) {
             const TypeFacts target = FactsOf(ReferenceIn(*definition.type()));
             const PropertyDefinition* key = KeyOf(target.target);
@@ -255,25 +261,30 @@ private:
     // Of the definitions that every model has from the start only those are
     // stored that something refers to. A definition may refer to others, so
     // the sets are gone through until nothing is added.
-    StoredObject StoredDictionary(const Object& from) {
+    StoredObject StoredDictionary(const Dictionary& from) {
         StoredObject out;
         out.classId = AuidOf(from.classId());
         closure_.AddClass(from.classId());
-        std::map<PropertyId, StoredProperty> sets;
-        for (const auto& entry : from.values()) {
-            if (StoredFormOf(entry.second->type()) == StoredForm::StrongSet) {
-                sets[entry.first] =
-                    EmptyProperty(*from.classDefinition().FindProperty(entry.first));
-            } else {
-                out.properties.push_back(StoredPropertyOf(from, entry.first, *entry.second));
+        for (const auto& [pid, value] : from.MadeValues()) {
+            if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
+                out.properties.push_back(StoredPropertyOf(from, pid, *value));
             }
         }
+        std::map<PropertyId, StoredProperty> sets;
         std::set<const Object*> stored;
         std::size_t before = 0;
         do {
             before = stored.size();
-            for (auto& set : sets) {
-                AddDefinitions(set.second, from.values().at(set.first)->objects(), stored);
+            MakeTargets(from);
+            for (const auto& [pid, value] : from.MadeValues()) {
+                if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
+                    continue;
+                }
+                const auto [set, isNew] = sets.try_emplace(pid);
+                if (isNew) {
+                    set->second = EmptyProperty(*from.classDefinition().FindProperty(pid));
+                }
+                AddDefinitions(set->second, value->objects(), stored);
             }
         } while (stored.size() != before);
         for (auto& set : sets) {
@@ -284,6 +295,21 @@ private:
         CheckTargets(out);
         SortByPid(out);
         return out;
+    }
+
+    // A built-in definition may be referred to before anybody has looked it up.
+    void MakeTargets(const Dictionary& dictionary) {
+        for (const auto& [path, keys] : targets_) {
+            if (IsWithinDictionary(path)) {
+                for (const Bytes& key : keys) {
+                    dictionary.FindDefinition(path[2], GuidOf(key));
+                }
+            }
+        }
+    }
+
+    static bool IsWithinDictionary(const Path& path) {
+        return path.size() == 3 && path[1] == prop::Header_Dictionary.pid;
     }
 
     void AddDefinitions(StoredProperty& set, const std::vector<RefPtr<Object>>& definitions,
@@ -303,7 +329,7 @@ private:
     void CheckTargets(const StoredObject& dictionary) {
         for (const auto& entry : targets_) {
             const Path& path = entry.first;
-            if (path.size() != 3 || path[1] != prop::Header_Dictionary.pid) {
+            if (!IsWithinDictionary(path)) {
                 continue;
             }
             const StoredProperty* set = dictionary.Find(path[2]);
@@ -324,6 +350,7 @@ private:
 
     Model& model_;
     MetaClosure closure_;
+    const MetaDictionary metaDictionary_;
     std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
     std::map<const ClassDefinition*, std::vector<const PropertyDefinition*>> required_;
 };
@@ -331,7 +358,11 @@ private:
 }  // namespace
 
 StoredObject TreeOfModel(Model& model, Object& header) {
-    return ModelWriter(model).Write(header);
+    return ModelWriter(model, StoredMetaDictionary).Write(header);
+}
+
+StoredObject TreeToWrite(Model& model, Object& header) {
+    return ModelWriter(model, LaidOutMetaDictionary).Write(header);
 }
 
 }  // namespace aaf::stored

@@ -30,8 +30,8 @@ std::u16string PropertyPart(const std::u16string& storedName, std::uint16_t pid)
 // For messages, "property 4803".
 std::string PropertyText(std::uint16_t pid);
 
-// UTF-16 to UTF-8, for libgsf and for messages. A lone half of a surrogate
-// pair becomes a question mark.
+// UTF-16 to UTF-8, for messages. A lone half of a surrogate pair becomes a
+// question mark.
 std::string ToUtf8(const std::u16string& text);
 
 }  // namespace aaf::stored

@@ -14,7 +14,8 @@ const StoredProperty* StoredObject::Find(std::uint16_t pid) const {
 }
 
 bool operator==(const StoredObject& left, const StoredObject& right) {
-    return left.classId == right.classId && left.properties == right.properties;
+    return left.classId == right.classId && left.properties == right.properties &&
+           left.laidOut == right.laidOut;
 }
 
 bool operator==(const StoredProperty& left, const StoredProperty& right) {

@@ -4,6 +4,7 @@
 
 #include <array>
 #include <cstdint>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -33,6 +34,7 @@ enum class StoredForm : std::uint16_t {
     Data = 0x82,
 };
 
+struct LaidOut;
 struct StoredProperty;
 
 // One object: a storage of the file. Every pid occurs once among the
@@ -40,6 +42,11 @@ struct StoredProperty;
 struct StoredObject {
     StoredAuid classId{};
     std::vector<StoredProperty> properties;
+
+    // What is written for the object where it was laid out before (LayOut in
+    // TreeWriter.h); then only the key of a set is looked for among the
+    // properties.
+    std::shared_ptr<const LaidOut> laidOut;
 
     const StoredProperty* Find(std::uint16_t pid) const;
 };

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/TreeWriter.h"
 
-#include "aaf_library/stored/CompoundFileWriter.h"
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/PropertyFormat.h"
 #include "aaf_library/stored/StoredNames.h"
@@ -10,7 +9,6 @@
 #include <algorithm>
 #include <map>
 #include <numeric>
-#include <set>
 
 // An object becomes a storage with a stream "properties":
 //
@@ -33,7 +31,7 @@ constexpr std::size_t kLargestValue = 0xFFFF;
 // its tag when it is used first.
 class TargetPaths {
 public:
-    std::uint16_t tag(const std::vector<std::uint16_t>& path) {
+    std::uint16_t tag(const TargetPath& path) {
         const bool bad = path.empty() || std::find(path.begin(), path.end(), 0) != path.end();
         if (bad) {
             throw StoredError("a weak reference without a path to its targets");
@@ -48,9 +46,19 @@ public:
         return tag;
     }
 
+    void BeginWith(const std::vector<TargetPath>& paths) {
+        const bool isBegun =
+            paths.size() <= paths_.size() && std::equal(paths.begin(), paths.end(), paths_.begin());
+        for (std::size_t i = 0; !isBegun && i < paths.size(); ++i) {
+            if (tag(paths[i]) != i) {
+                throw StoredError("an object was laid out for another table of targets");
+            }
+        }
+    }
+
     Bytes Table() const {
         ByteWriter pids;
-        for (const std::vector<std::uint16_t>& path : paths_) {
+        for (const TargetPath& path : paths_) {
             for (std::uint16_t pid : path) {
                 pids.AppendNumber(pid);
             }
@@ -65,8 +73,8 @@ public:
     }
 
 private:
-    std::vector<std::vector<std::uint16_t>> paths_;
-    std::map<std::vector<std::uint16_t>, std::uint16_t> tags_;
+    std::vector<TargetPath> paths_;
+    std::map<TargetPath, std::uint16_t> tags_;
 };
 
 // What an object's storage holds besides its property table. Names cannot
@@ -122,23 +130,39 @@ public:
     explicit TreeWriter(SectorSize sectorSize) : file_(sectorSize) {}
 
     Bytes Write(const StoredObject& root) {
-        Fill(file_.root(), root, 0);
+        Fill(CompoundFileWriter::kRoot, root, 0);
         // Tags are handed out on the way, so the table comes last. Readers
         // want it, even without a path in it.
-        file_.root().stream(kReferencedPropertiesStream, paths_.Table());
+        file_.AddStream(CompoundFileWriter::kRoot, kReferencedPropertiesStream, paths_.Table());
         return file_.Finish();
     }
 
+    std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
+                                          const std::vector<TargetPath>& paths) {
+        paths_.BeginWith(paths);
+        Fill(CompoundFileWriter::kRoot, object, 0);
+        std::optional<CompoundPart> part = file_.FinishPart();
+        return part ? std::make_shared<const LaidOut>(LaidOut{std::move(*part), paths}) : nullptr;
+    }
+
 private:
-    void Fill(StorageWriter& storage, const StoredObject& object, int depth) {
+    using Storage = CompoundFileWriter::Storage;
+
+    void Fill(Storage storage, const StoredObject& object, int depth) {
         if (depth > kMaximumDepth) {
             throw StoredError("objects are nested too deep");
         }
         Layout layout;
-        std::set<std::uint16_t> pids;
+        std::vector<std::uint16_t> pids;
+        pids.reserve(object.properties.size());
+        for (const StoredProperty& property : object.properties) {
+            pids.push_back(property.pid);
+        }
+        std::sort(pids.begin(), pids.end());
+        const auto twice = std::adjacent_find(pids.begin(), pids.end());
         for (const StoredProperty& property : object.properties) {
             try {
-                if (!pids.insert(property.pid).second) {
+                if (twice != pids.end() && property.pid == *twice) {
                     throw StoredError("occurs twice in one object");
                 }
                 AddProperty(layout, property);
@@ -149,28 +173,31 @@ private:
         WriteLayout(storage, object, layout, depth);
     }
 
-    void WriteLayout(StorageWriter& storage, const StoredObject& object, const Layout& layout,
-                     int depth) {
-        storage.SetClass(object.classId);
-        storage.stream(kPropertiesStream,
-                       ByteWriter()
-                           .AppendNumber(kLittleEndianMark)
-                           .AppendNumber(kPropertiesVersion)
-                           .AppendNumber(static_cast<std::uint16_t>(layout.count))
-                           .Append(layout.entries.bytes())
-                           .Append(layout.values.bytes())
-                           .bytes());
+    void WriteLayout(Storage storage, const StoredObject& object, const Layout& layout, int depth) {
+        file_.SetClass(storage, object.classId);
+        file_.AddStream(storage, kPropertiesStream,
+                        ByteWriter()
+                            .AppendNumber(kLittleEndianMark)
+                            .AppendNumber(kPropertiesVersion)
+                            .AppendNumber(static_cast<std::uint16_t>(layout.count))
+                            .Append(layout.entries.bytes())
+                            .Append(layout.values.bytes())
+                            .bytes());
         for (const Layout::Stream& stream : layout.streams) {
-            storage.stream(stream.name, stream.borrowed ? *stream.borrowed : stream.made);
+            file_.AddStream(storage, stream.name, stream.borrowed ? *stream.borrowed : stream.made);
         }
         for (const Layout::Child& child : layout.children) {
-            StorageWriter contained = storage.storage(child.name);
+            if (const LaidOut* const known = child.object->laidOut.get()) {
+                paths_.BeginWith(known->paths);
+                file_.AddPart(storage, child.name, known->part);
+                continue;
+            }
+            const Storage contained = file_.AddStorage(storage, child.name);
             try {
                 Fill(contained, *child.object, depth + 1);
             } catch (const StoredError& problem) {
                 throw StoredError(ToUtf8(child.name) + ": " + problem.what());
             }
-            contained.Close();
         }
     }
 
@@ -317,6 +344,11 @@ private:
 
 Bytes WriteTree(const StoredObject& root, SectorSize sectorSize) {
     return TreeWriter(sectorSize).Write(root);
+}
+
+std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
+                                      const std::vector<TargetPath>& paths) {
+    return TreeWriter(SectorSize::Bytes512).LayOut(object, paths);
 }
 
 }  // namespace aaf::stored

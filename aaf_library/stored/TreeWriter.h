@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/stored/CompoundFileWriter.h"
 #include "aaf_library/stored/StoredTree.h"
 
 namespace aaf::stored {
@@ -11,5 +12,19 @@ namespace aaf::stored {
 // since readers take an entry without bytes amiss; sets are written in the
 // order of their keys. The same tree gives the same bytes. Throws StoredError.
 Bytes WriteTree(const StoredObject& root, SectorSize sectorSize);
+
+using TargetPath = std::vector<std::uint16_t>;
+
+// An object with all that it contains as it stands in a file whose table of
+// targets begins with these paths.
+struct LaidOut {
+    CompoundPart part;
+    std::vector<TargetPath> paths;
+};
+
+// For objects that many files hold. Null when one of its streams is so long
+// that it can't be shared. Throws StoredError.
+std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
+                                      const std::vector<TargetPath>& paths);
 
 }  // namespace aaf::stored

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // How long a caller waits for whole programs: cliphost that tells its version or its types, and
-// that describes one movie, beside ffprobe and mediainfo for the same movie.
+// that describes a movie without FFmpeg, beside ffprobe and mediainfo for one of these.
 
 #include <benchmark/benchmark.h>
 #include <unistd.h>
@@ -10,6 +10,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <string>
+#include <vector>
 
 #include "benchmarks/support/Ratios.h"
 #include "tests/support/Quoted.h"
@@ -19,31 +20,40 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// A short movie with one picture and one sound track in a folder of its own, deleted when the
-// process ends.
-class ShortMovie {
+// Short movies, deleted when the process ends: pictures and sound, DV of PAL, sound alone.
+class ShortMovies {
 public:
-    ShortMovie()
+    ShortMovies()
         : folder_(fs::temp_directory_path() / ("bench-program-" + std::to_string(getpid()))) {
         fs::create_directories(folder_);
-        movies::Movie movie;
-        movies::VideoFormat format;
-        format.codec = "apcn";
-        movie.tracks.push_back(movies::VideoTrack(format, 50, 25, 1));
-        movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 96000));
-        movies::Build(movie).WriteTo((folder_ / "short.mov").string());
+        movies::VideoFormat prores;
+        prores.codec = "apcn";
+        movies::VideoFormat dv;
+        dv.codec = "dvcp";
+        dv.width = 720;
+        dv.height = 576;
+        const movies::Track sound = movies::SoundTrack(movies::SoundFormat(), 96000);
+        Write("prores", {movies::VideoTrack(prores, 50, 25, 1), sound});
+        Write("dv", {movies::VideoTrack(dv, 50, 25, 1), sound});
+        Write("sound", {sound});
     }
-    ~ShortMovie() { fs::remove_all(folder_); }
+    ~ShortMovies() { fs::remove_all(folder_); }
     std::string Folder() const { return Quoted(folder_); }
-    std::string Path() const { return Quoted(folder_ / "short.mov"); }
+    std::string Path(const std::string& name) const { return Quoted(folder_ / (name + ".mov")); }
 
 private:
+    void Write(const std::string& name, const std::vector<movies::Track>& tracks) {
+        movies::Movie movie;
+        movie.tracks = tracks;
+        movies::Build(movie).WriteTo((folder_ / (name + ".mov")).string());
+    }
+
     fs::path folder_;
 };
 
-const ShortMovie& TheMovie() {
-    static const ShortMovie movie;
-    return movie;
+const ShortMovies& Movies() {
+    static const ShortMovies movies;
+    return movies;
 }
 
 void Run(benchmark::State& state, const std::string& command) {
@@ -74,16 +84,22 @@ void Plugin(benchmark::State& state) {
     Run(state, Cliphost("plugin"));
 }
 void Scan(benchmark::State& state) {
-    Run(state, Cliphost("scan " + TheMovie().Folder()));
+    Run(state, Cliphost("scan " + Movies().Folder()));
 }
 void Describe(benchmark::State& state) {
-    Run(state, Cliphost("describe " + TheMovie().Path()));
+    Run(state, Cliphost("describe " + Movies().Path("prores")));
+}
+void DescribeDv(benchmark::State& state) {
+    Run(state, Cliphost("describe " + Movies().Path("dv")));
+}
+void DescribeSound(benchmark::State& state) {
+    Run(state, Cliphost("describe " + Movies().Path("sound")));
 }
 void Ffprobe(benchmark::State& state) {
-    Run(state, "ffprobe -v error -show_format -show_streams " + TheMovie().Path());
+    Run(state, "ffprobe -v error -show_format -show_streams " + Movies().Path("prores"));
 }
 void Mediainfo(benchmark::State& state) {
-    Run(state, "mediainfo " + TheMovie().Path());
+    Run(state, "mediainfo " + Movies().Path("prores"));
 }
 
 BENCHMARK(Nothing)->Unit(benchmark::kMillisecond)->UseRealTime();
@@ -92,6 +108,8 @@ BENCHMARK(Types)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(Plugin)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(Scan)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(Describe)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(DescribeDv)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(DescribeSound)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(Ffprobe)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(Mediainfo)->Unit(benchmark::kMillisecond)->UseRealTime();
 
@@ -104,6 +122,8 @@ int main(int argc, char** argv) {
                           {"Plugin", "", SecondsAtMost(0.008)},
                           {"Scan", "", SecondsAtMost(0.008)},
                           {"Describe", "", SecondsAtMost(0.008)},
+                          {"DescribeDv", "", SecondsAtMost(0.008)},
+                          {"DescribeSound", "", SecondsAtMost(0.008)},
                           {"Describe", "Ffprobe", TimesAtMost(0.25)},
                           {"Describe", "Mediainfo", TimesAtMost(1)}});
 }

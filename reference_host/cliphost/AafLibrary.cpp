@@ -134,7 +134,7 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     identification.platform = platform;
     identification.productVersion = &productVersion;
 
-    OutputFile output(path);
+    OutputFile output(path, OutputFile::Writer::Other);
     const LibrarySentence said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
     const auto check = [&](HRESULT result, const char* step) {
         if (result >= 0) {
@@ -143,6 +143,7 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
         if (const int error = SystemErrorIn(said.text())) {
             output.Fail(error);
         }
+        output.TryPlace();
         const std::string reason = said.text().empty() ? TextOfResult(result) : said.text();
         throw Failure(
             kExitCaller, path,
@@ -151,11 +152,11 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
                 reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result)) : reason));
     };
     host::Ref<IAAFFile> copy;
-    check(openNew(WideName(output.LeaveToOther()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
+    check(openNew(WideName(output.NameForOther()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
                   &identification, copy.Out()),
           "opening a new file");
+    // This saves the copy, too.
     check(file->SaveCopyAs(copy.get()), "copying the description");
-    check(copy->Save(), "saving");
     check(copy->Close(), "closing");
     output.Finish();
 }

@@ -85,7 +85,7 @@ void DescribeRun::Plan() {
     for (const std::filesystem::path& path : options_.paths) {
         std::error_code ignored;
         if (!std::filesystem::is_directory(path, ignored)) {
-            steps_.push_back({path, {}, 0, {}, {}});
+            steps_.push_back({path.native(), {}, 0, {}, {}});
             continue;
         }
         try {
@@ -109,7 +109,7 @@ void DescribeRun::PlanFolder(const std::filesystem::path& folder) {
         Refuse(problem.subject, kExitCaller, problem);
     }
     if (const Problem leftOut = LeftOut(folder, clips->others())) {
-        steps_.push_back({folder, {}, 0, {}, std::make_shared<const Problem>(leftOut)});
+        steps_.push_back({folder.native(), {}, 0, {}, std::make_shared<const Problem>(leftOut)});
     }
     for (const FolderClip& clip : clips->clips()) {
         steps_.push_back({clip.path, clips, clip.index, {}, {}});
@@ -117,13 +117,13 @@ void DescribeRun::PlanFolder(const std::filesystem::path& folder) {
 }
 
 void DescribeRun::Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
-    steps_.push_back({path, {}, 0, std::make_shared<const Failure>(status, problem), {}});
+    steps_.push_back({path.native(), {}, 0, std::make_shared<const Failure>(status, problem), {}});
 }
 
 void DescribeRun::DescribeHere() {
     progress_.emplace(kProgress, steps_.size());
     for (const Step& step : steps_) {
-        progress_->Step(DisplayPath(step.movie.filename()));
+        progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
         if (!step.IsMovie()) {
             TellInstead(step);
             continue;
@@ -149,7 +149,7 @@ void DescribeRun::DescribeInWorkers() {
     for (std::size_t i = 0; i < steps_.size(); ++i) {
         if (steps_[i].IsMovie()) {
             steps_[i].folder.reset();
-            requests.push_back(steps_[i].movie.native());
+            requests.push_back(steps_[i].movie);
             placesOfRequests_.push_back(i);
         }
     }
@@ -171,7 +171,8 @@ void DescribeRun::TellThoseBefore(std::size_t place) {
 }
 
 void DescribeRun::Begin(std::size_t number) {
-    progress_->Step(DisplayPath(steps_[placesOfRequests_[number]].movie.filename()));
+    progress_->Step(
+        DisplayPath(std::filesystem::path(steps_[placesOfRequests_[number]].movie).filename()));
 }
 
 bool DescribeRun::Read(std::size_t number, const std::string& answer) {
@@ -253,6 +254,10 @@ std::filesystem::path DescribeRun::TargetFor(const std::filesystem::path& movie)
         if (targetsTaken_.insert(free).second) {
             target = free;
         }
+    }
+    std::error_code ignored;
+    if (!std::filesystem::exists(target, ignored)) {
+        return target;  // so it is no movie
     }
     RefuseOutputOntoMovie(target, movie);
     for (const std::filesystem::path& other : options_.paths) {

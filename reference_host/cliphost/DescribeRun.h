@@ -37,7 +37,7 @@ public:
 private:
     // One movie, or what is told in its place.
     struct Step {
-        std::filesystem::path movie;
+        std::filesystem::path::string_type movie;   // as in FolderClip
         std::shared_ptr<const FolderClips> folder;  // where it is out of a list
         ncfSInt32 index = 0;                        // in that
         std::shared_ptr<const Failure> refusal;     // it can't be asked for

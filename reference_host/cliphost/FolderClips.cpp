@@ -180,11 +180,11 @@ FolderClips::FolderClips(Session& session, const std::filesystem::path& folder)
     const ncfSInt32 count = list_->GetCount();
     for (ncfSInt32 i = 0; i < count; ++i) {
         const auto text = host::MakeString(std::string_view());
-        FolderClip clip{i, {}};
+        std::filesystem::path clip;
         Check(list_->GetClipPath(i, text.get()), "no path of a movie");
-        Check(host::PathFrom(text.get(), clip.path), "a path that no file can have");
-        if (fromBackslash.erase(clip.path) == 0) {
-            clips_.push_back(clip);
+        Check(host::PathFrom(text.get(), clip), "a path that no file can have");
+        if (fromBackslash.erase(clip) == 0) {
+            clips_.push_back({i, clip.native()});
         }
     }
     std::sort(clips_.begin(), clips_.end(),

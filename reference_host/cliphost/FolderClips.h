@@ -14,7 +14,8 @@ namespace cliphost {
 // One movie of the module's list.
 struct FolderClip {
     ncfSInt32 index;  // in the module's list
-    std::filesystem::path path;
+    // A path takes five times the memory of its text, and a folder may hold 100,000 movies.
+    std::filesystem::path::string_type path;
 };
 
 // Movies of a folder that the module's list lacks, each kind by name.

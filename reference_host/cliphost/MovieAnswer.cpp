@@ -49,24 +49,25 @@ MovieAnswer AnswerOf(Session& session, const Description& description, const Des
         TellProblem(description.doubt, session.verbosity());
     }
     const std::filesystem::path saved = place();
-    host::Ref<IAAFFile> shown = description.file;
+    const bool isOnDisk = !saved.empty() && !OutputFile::IsDevice(saved);
     if (!saved.empty()) {
-        const bool isDevice = OutputFile::IsDevice(saved);
         session.aaf().Save(description.file.get(), saved);
-        // What is shown is what any reader of the saved file finds.
-        shown = isDevice ? shown : session.aaf().Open(saved);
     }
     TellRoute(description.movie, session.verbosity());
     if (host::system::IsStandardOutput(saved)) {
         return answer;  // what is shown would be in the midst of the file
     }
+    // What is shown is what any reader of the saved file finds.
+    const auto shown = [&] {
+        return ReadTree((isOnDisk ? session.aaf().Open(saved) : description.file).get());
+    };
     if (form.json) {
         const RouteTaken taken = RouteOf(description.movie);
         answer.route = taken.route;
         answer.routeReason = taken.reason;
-        answer.description = InEntry(ToJson(ReadTree(shown.get())));
+        answer.description = InEntry(ToJson(shown()));
     } else if (!form.quiet) {
-        answer.description = ToReadableText(ReadTree(shown.get()), 1);
+        answer.description = ToReadableText(shown(), 1);
     }
     return answer;
 }

@@ -23,7 +23,7 @@ bool OutputFile::IsDevice(const std::filesystem::path& path) {
             !std::filesystem::is_directory(there));
 }
 
-OutputFile::OutputFile(std::filesystem::path path) : path_(std::move(path)) {
+OutputFile::OutputFile(std::filesystem::path path, Writer writer) : path_(std::move(path)) {
     if (const std::optional<int> open = DescriptorOf(path_)) {
         Check(stream_.OpenCopyOf(*open));
         return;
@@ -43,7 +43,9 @@ OutputFile::OutputFile(std::filesystem::path path) : path_(std::move(path)) {
     if (!std::filesystem::exists(status) || std::filesystem::is_regular_file(status)) {
         unfinished_.emplace(path_);
     }
-    Check(stream_.Open(unfinished_ ? unfinished_->path() : path_));
+    if (writer == Writer::Self || !unfinished_) {
+        Check(stream_.Open(unfinished_ ? unfinished_->path() : path_));
+    }
 }
 
 void OutputFile::Write(const void* bytes, std::size_t size) {
@@ -63,11 +65,8 @@ void OutputFile::Finish() {
     }
 }
 
-const std::filesystem::path& OutputFile::LeaveToOther() {
-    std::error_code ignored;
-    stream_.Close();
-    std::filesystem::remove(unfinished_->path(), ignored);
-    return unfinished_->path();
+void OutputFile::TryPlace() {
+    Check(stream_.Open(unfinished_->path()));
 }
 
 void OutputFile::Check(int error) {

@@ -25,16 +25,22 @@ public:
 // standard output, and devices and pipes.
 class OutputFile {
 public:
-    explicit OutputFile(std::filesystem::path path);  // throws a Failure
+    // Who writes what cannot be renamed is always this object.
+    enum class Writer { Self, Other };
+
+    explicit OutputFile(std::filesystem::path path,
+                        Writer writer = Writer::Self);  // throws a Failure
     OutputFile(const OutputFile&) = delete;
     OutputFile& operator=(const OutputFile&) = delete;
 
     // Throws a Failure that tells why, or ReaderGone.
     void Write(const void* bytes, std::size_t size);
     void Finish();  // throws a Failure
-    // Leaves the writing to somebody who makes a file of his own: the name that
-    // he is to give it, at which nothing is. Not for devices.
-    const std::filesystem::path& LeaveToOther();
+    // For somebody else who makes a file of his own: the name that he is to give
+    // it, at which nothing is. Not for devices.
+    const std::filesystem::path& NameForOther() const { return unfinished_->path(); }
+    // Throws the Failure if the system lets nobody write there.
+    void TryPlace();
     // Throws the Failure for what the system said.
     [[noreturn]] void Fail(int error);
 

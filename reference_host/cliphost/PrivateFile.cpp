@@ -36,14 +36,14 @@ void PutIntoPlace(const std::filesystem::path& file, const std::filesystem::path
         throw Failure(kExitFile, place,
                       "not written: the process that read the movie left no file");
     }
-    OutputFile output(place);
+    OutputFile output(place, OutputFile::Writer::Other);
     if (OutputFile::IsDevice(place)) {
         CopyInto(output, file);
     } else {
-        std::filesystem::rename(file, output.LeaveToOther(), error);
+        std::filesystem::rename(file, output.NameForOther(), error);
         if (error == std::errc::cross_device_link) {
             error.clear();
-            std::filesystem::copy_file(file, output.LeaveToOther(), error);
+            std::filesystem::copy_file(file, output.NameForOther(), error);
             std::error_code ignored;
             std::filesystem::remove(file, ignored);
         }

@@ -13,7 +13,7 @@ namespace host {
 
 namespace {
 
-constexpr std::size_t kPiece = std::size_t{1} << 20;
+constexpr std::size_t kPiece = std::size_t{1} << 16;  // more costs more to come by than to read
 
 NCFRESULT Inspect(const std::filesystem::path& file, std::string& problem) {
     std::error_code failure;

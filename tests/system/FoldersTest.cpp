@@ -88,7 +88,8 @@ TEST_F(Folders, WithOneBadMovieStillGiveTheOthers) {
     for (const cliphost::FolderClip& clip : clips.clips()) {
         const auto description =
             cliphost::DescribeFromList(session(), clips.list(), clip.index, clip.path);
-        described[clip.path.filename()] = static_cast<bool>(description.file);
+        described[std::filesystem::path(clip.path).filename()] =
+            static_cast<bool>(description.file);
         EXPECT_EQ(description.result < 0, !description.file);
     }
     EXPECT_EQ(described, (std::map<std::string, bool>{

@@ -39,6 +39,39 @@ TEST(OutputFile, LeavesNothingWhenItEndsUnfinishedAndKeepsWhatWasThereBefore) {
     EXPECT_EQ(folder.CountFiles(), 1u);
 }
 
+TEST(OutputFile, LeavesTheWritingToAnother) {
+    const TestFolder folder;
+    {
+        OutputFile file(folder / "a.aaf", OutputFile::Writer::Other);
+        EXPECT_EQ(folder.CountFiles(), 0u);
+        WriteFile(file.NameForOther(), "whole");
+        EXPECT_FALSE(std::filesystem::exists(folder / "a.aaf"));
+        file.Finish();
+    }
+    EXPECT_EQ(ContentOf(folder / "a.aaf"), "whole");
+    {
+        OutputFile file(folder / "a.aaf", OutputFile::Writer::Other);
+        WriteFile(file.NameForOther(), "half");
+    }
+    EXPECT_EQ(ContentOf(folder / "a.aaf"), "whole");
+    EXPECT_EQ(folder.CountFiles(), 1u);
+}
+
+TEST(OutputFile, TellsWhyAnotherCantWrite) {
+    const TestFolder folder;
+    OutputFile possible(folder / "a.aaf", OutputFile::Writer::Other);
+    EXPECT_NO_THROW(possible.TryPlace());
+    OutputFile file(folder / "no" / "a.aaf", OutputFile::Writer::Other);
+    try {
+        file.TryPlace();
+        ADD_FAILURE() << "nothing can be written there";
+    } catch (const Failure& failure) {
+        EXPECT_NE(std::string(failure.what()).find("a.aaf: not written: No such file"),
+                  std::string::npos)
+            << failure.what();
+    }
+}
+
 TEST(OutputFile, TellsWhyItCantBeWritten) {
     const TestFolder folder;
     const auto expectFailure = [](const std::filesystem::path& path, const char* why) {

@@ -14,11 +14,10 @@ namespace {
 
 Bytes ThreeStreams() {
     CompoundFileWriter writer(SectorSize::Bytes512);
-    writer.root().stream(u"a", Bytes(10, 1));
-    writer.root().stream(u"b", Bytes(5000, 2));
-    StorageWriter inner = writer.root().storage(u"inner");
-    inner.stream(u"c", Bytes(100, 3));
-    inner.Close();
+    writer.AddStream(CompoundFileWriter::kRoot, u"a", Bytes(10, 1));
+    writer.AddStream(CompoundFileWriter::kRoot, u"b", Bytes(5000, 2));
+    const auto inner = writer.AddStorage(CompoundFileWriter::kRoot, u"inner");
+    writer.AddStream(inner, u"c", Bytes(100, 3));
     return writer.Finish();
 }
 
@@ -52,12 +51,6 @@ std::string refusal(const Bytes& file) {
         return problem.what();
     }
 }
-
-constexpr std::size_t kLeftOffset = 68;
-constexpr std::size_t kRightOffset = 72;
-constexpr std::size_t kChildOffset = 76;
-constexpr std::size_t kStartOffset = 116;
-constexpr std::size_t kSizeOffset = 120;
 
 }  // namespace
 
@@ -95,8 +88,8 @@ TEST(CompoundFileReader, RefusesOtherKindsOfFiles) {
 
 TEST(CompoundFileReader, RefusesACircleAmongSiblings) {
     Bytes file = ThreeStreams();
-    const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kChildOffset);
-    put(file, EntryAt(file, first) + kLeftOffset, first);
+    const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kEntryChildOffset);
+    put(file, EntryAt(file, first) + kEntryLeftOffset, first);
     EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
 }
 
@@ -104,7 +97,7 @@ TEST(CompoundFileReader, RefusesAStorageThatContainsTheRoot) {
     Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
         if (file[EntryAt(file, i) + 66] == 1) {
-            put(file, EntryAt(file, i) + kChildOffset, 0);
+            put(file, EntryAt(file, i) + kEntryChildOffset, 0);
         }
     }
     EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
@@ -112,8 +105,8 @@ TEST(CompoundFileReader, RefusesAStorageThatContainsTheRoot) {
 
 TEST(CompoundFileReader, RefusesAnEntryBeyondTheDirectory) {
     Bytes file = ThreeStreams();
-    const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kChildOffset);
-    put(file, EntryAt(file, first) + kRightOffset, 5000);
+    const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kEntryChildOffset);
+    put(file, EntryAt(file, first) + kEntryRightOffset, 5000);
     EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
 }
 
@@ -128,8 +121,8 @@ TEST(CompoundFileReader, RefusesAChainThatRunsInACircle) {
 TEST(CompoundFileReader, RefusesAStreamThatRunsOutOfTheFile) {
     Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
-        if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 5000) {
-            put(file, EntryAt(file, i) + kStartOffset, 4000);
+        if (NumberAt(file, EntryAt(file, i) + kEntrySizeOffset) == 5000) {
+            put(file, EntryAt(file, i) + kEntryStartOffset, 4000);
         }
     }
     EXPECT_EQ(refusal(file), "sector 4000 lies beyond the end of the file");
@@ -138,8 +131,8 @@ TEST(CompoundFileReader, RefusesAStreamThatRunsOutOfTheFile) {
 TEST(CompoundFileReader, RefusesAHugeClaimBeforeItTakesMemory) {
     Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
-        if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 5000) {
-            put(file, EntryAt(file, i) + kSizeOffset, 0xFFFFFFF0);
+        if (NumberAt(file, EntryAt(file, i) + kEntrySizeOffset) == 5000) {
+            put(file, EntryAt(file, i) + kEntrySizeOffset, 0xFFFFFFF0);
         }
     }
     EXPECT_EQ(refusal(file), "a stream claims 4294967280 bytes");
@@ -151,11 +144,11 @@ TEST(CompoundFileReader, RefusesAHugeClaimBeforeItTakesMemory) {
 TEST(CompoundFileReader, RefusesTwoStreamsThatShareASector) {
     Bytes file = ThreeStreams();
     for (std::size_t i = 1; i < 5; ++i) {
-        if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 10) {
-            put(file, EntryAt(file, i) + kSizeOffset, 5000);
-            put(file, EntryAt(file, i) + kStartOffset, 0);
-        } else if (NumberAt(file, EntryAt(file, i) + kSizeOffset) == 5000) {
-            put(file, EntryAt(file, i) + kStartOffset, 0);
+        if (NumberAt(file, EntryAt(file, i) + kEntrySizeOffset) == 10) {
+            put(file, EntryAt(file, i) + kEntrySizeOffset, 5000);
+            put(file, EntryAt(file, i) + kEntryStartOffset, 0);
+        } else if (NumberAt(file, EntryAt(file, i) + kEntrySizeOffset) == 5000) {
+            put(file, EntryAt(file, i) + kEntryStartOffset, 0);
         }
     }
     EXPECT_EQ(refusal(file), "sector 0 is used twice");
@@ -194,9 +187,9 @@ TEST(CompoundFileReader, WalksAVeryLongChainOfSiblings) {
         }
         file[at + 64] = static_cast<std::uint8_t>(2 * name.size() + 2);
         file[at + 66] = i == 0 ? 5 : 1;
-        put(file, at + kLeftOffset, kFreeSector);
-        put(file, at + kRightOffset, i == 0 || i == count ? kFreeSector : i + 1);
-        put(file, at + kChildOffset, i == 0 ? 1 : kFreeSector);
+        put(file, at + kEntryLeftOffset, kFreeSector);
+        put(file, at + kEntryRightOffset, i == 0 || i == count ? kFreeSector : i + 1);
+        put(file, at + kEntryChildOffset, i == 0 ? 1 : kFreeSector);
     }
     CompoundFileReader reader(file);
     EXPECT_EQ(reader.entry(CompoundFileReader::kRootIndex).contained.size(), count);

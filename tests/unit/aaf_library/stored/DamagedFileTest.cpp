@@ -25,11 +25,14 @@ std::string refusal(const Bytes& file) {
     }
 }
 
+using Storage = CompoundFileWriter::Storage;
+constexpr Storage kRoot = CompoundFileWriter::kRoot;
+
 // A file whose root storage holds what the function puts there.
-Bytes FileWith(const std::function<void(StorageWriter&)>& fill) {
+Bytes FileWith(const std::function<void(CompoundFileWriter&)>& fill) {
     CompoundFileWriter writer(SectorSize::Bytes512);
-    writer.root().SetClass(kRootClassId);
-    fill(writer.root());
+    writer.SetClass(kRoot, kRootClassId);
+    fill(writer);
     return writer.Finish();
 }
 
@@ -51,13 +54,14 @@ Bytes name(const std::u16string& text) {
 }
 
 Bytes FileWithProperties(const Bytes& properties) {
-    return FileWith([&](StorageWriter& root) { root.stream(u"properties", properties); });
+    return FileWith(
+        [&](CompoundFileWriter& writer) { writer.AddStream(kRoot, u"properties", properties); });
 }
 
 Bytes FileWithIndex(std::uint16_t form, const Bytes& index) {
-    return FileWith([&](StorageWriter& root) {
-        root.stream(u"properties", OneProperty(0x1901, form, name(u"Mobs-1901")));
-        root.stream(u"Mobs-1901 index", index);
+    return FileWith([&](CompoundFileWriter& writer) {
+        writer.AddStream(kRoot, u"properties", OneProperty(0x1901, form, name(u"Mobs-1901")));
+        writer.AddStream(kRoot, u"Mobs-1901 index", index);
     });
 }
 
@@ -107,7 +111,7 @@ TEST(DamagedFile, WithSeveralRandomBytesIsReadOrRefusedButNeverHarms) {
 }
 
 TEST(DamagedFile, WithoutPropertiesIsRefused) {
-    EXPECT_EQ(refusal(FileWith([](StorageWriter&) {})), "\"properties\" is missing");
+    EXPECT_EQ(refusal(FileWith([](CompoundFileWriter&) {})), "\"properties\" is missing");
 }
 
 TEST(DamagedFile, WithAPropertyTableThatEndsEarlyIsRefused) {
@@ -153,12 +157,11 @@ TEST(DamagedFile, WithOneObjectInTwoPlacesIsRefused) {
                       .AppendNumber(std::uint32_t{0})
                       .AppendNumber(std::uint32_t{0})
                       .bytes();
-    const Bytes file = FileWith([&](StorageWriter& root) {
-        root.stream(u"properties", OneProperty(0x4403, 0x32, name(u"Slots-4403")));
-        root.stream(u"Slots-4403 index", index);
-        StorageWriter slot = root.storage(u"Slots-4403{0}");
-        slot.stream(u"properties", {0x4C, 0x20, 0, 0});
-        slot.Close();
+    const Bytes file = FileWith([&](CompoundFileWriter& writer) {
+        writer.AddStream(kRoot, u"properties", OneProperty(0x4403, 0x32, name(u"Slots-4403")));
+        writer.AddStream(kRoot, u"Slots-4403 index", index);
+        const Storage slot = writer.AddStorage(kRoot, u"Slots-4403{0}");
+        writer.AddStream(slot, u"properties", {0x4C, 0x20, 0, 0});
     });
     EXPECT_EQ(refusal(file), "property 4403: \"Slots-4403{0}\" is referred to twice");
 }
@@ -184,13 +187,12 @@ TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
     for (std::uint32_t i = 0; i < 2; ++i) {
         index.AppendNumber(i).AppendNumber(std::uint32_t{1}).Append(Bytes(16, 7));
     }
-    const Bytes file = FileWith([&](StorageWriter& root) {
-        root.stream(u"properties", OneProperty(0x1901, 0x3A, name(u"Mobs-1901")));
-        root.stream(u"Mobs-1901 index", index.bytes());
+    const Bytes file = FileWith([&](CompoundFileWriter& writer) {
+        writer.AddStream(kRoot, u"properties", OneProperty(0x1901, 0x3A, name(u"Mobs-1901")));
+        writer.AddStream(kRoot, u"Mobs-1901 index", index.bytes());
         for (const char16_t* element : {u"Mobs-1901{0}", u"Mobs-1901{1}"}) {
-            StorageWriter mob = root.storage(element);
-            mob.stream(u"properties", {0x4C, 0x20, 0, 0});
-            mob.Close();
+            const Storage mob = writer.AddStorage(kRoot, element);
+            writer.AddStream(mob, u"properties", {0x4C, 0x20, 0, 0});
         }
     });
     EXPECT_EQ(refusal(file), "property 1901: a set has a key twice");
@@ -207,9 +209,9 @@ TEST(DamagedFile, WithAWeakReferenceBeyondTheTableIsRefused) {
 
 TEST(DamagedFile, WithATableOfWeakReferencesThatLiesIsRefused) {
     const auto withTable = [](const Bytes& table) {
-        return FileWith([&](StorageWriter& root) {
-            root.stream(u"properties", {0x4C, 0x20, 0, 0});
-            root.stream(u"referenced properties", table);
+        return FileWith([&](CompoundFileWriter& writer) {
+            writer.AddStream(kRoot, u"properties", {0x4C, 0x20, 0, 0});
+            writer.AddStream(kRoot, u"referenced properties", table);
         });
     };
     EXPECT_EQ(refusal(withTable({0x4C, 1, 0, 2, 0, 0, 0, 1, 0, 0, 0})), "");
@@ -220,22 +222,23 @@ TEST(DamagedFile, WithATableOfWeakReferencesThatLiesIsRefused) {
 }
 
 TEST(DamagedFile, NestedWithoutEndIsRefused) {
-    std::function<void(StorageWriter&, int)> nest = [&](StorageWriter& storage, int depth) {
-        storage.stream(u"properties", OneProperty(0x4803, 0x22, name(u"Segment-4803")));
+    std::function<void(CompoundFileWriter&, Storage, int)> nest = [&](CompoundFileWriter& writer,
+                                                                      Storage storage, int depth) {
+        writer.AddStream(storage, u"properties", OneProperty(0x4803, 0x22, name(u"Segment-4803")));
         if (depth > 0) {
-            StorageWriter inner = storage.storage(u"Segment-4803");
-            nest(inner, depth - 1);
-            inner.Close();
+            const Storage inner = writer.AddStorage(storage, u"Segment-4803");
+            nest(writer, inner, depth - 1);
         }
     };
-    const Bytes file = FileWith([&](StorageWriter& root) { nest(root, kMaximumDepth + 50); });
+    const Bytes file =
+        FileWith([&](CompoundFileWriter& writer) { nest(writer, kRoot, kMaximumDepth + 50); });
     EXPECT_NE(refusal(file).find("objects are nested too deep"), std::string::npos);
 }
 
 TEST(DamagedFile, StoragesThatNobodyNamesArePassedOver) {
-    const Bytes file = FileWith([&](StorageWriter& root) {
-        root.stream(u"properties", {0x4C, 0x20, 0, 0});
-        root.stream(u"something else", {1, 2, 3});
+    const Bytes file = FileWith([&](CompoundFileWriter& writer) {
+        writer.AddStream(kRoot, u"properties", {0x4C, 0x20, 0, 0});
+        writer.AddStream(kRoot, u"something else", {1, 2, 3});
     });
     EXPECT_EQ(refusal(file), "");
 }

@@ -4,7 +4,9 @@
 #include "aaf_library/stored/ModelNames.h"
 
 #include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/model/TypeExtendibleEnumeration.h"
 #include "aaf_library/model/TypeRecord.h"
+#include "aaf_library/stored/MetaClosure.h"
 #include "aaf_library/stored/MetaPids.h"
 #include "aaf_library/stored/MetaRecords.h"
 #include "aaf_library/stored/ModelReader.h"
@@ -21,6 +23,7 @@
 
 #include <gtest/gtest.h>
 #include <algorithm>
+#include <functional>
 #include <set>
 
 using namespace aaf;
@@ -65,7 +68,88 @@ std::set<std::wstring> StoredClasses(const StoredObject& root) {
     return names;
 }
 
+// A file of all built-in definitions alone.
+Bytes DefinitionsIn(Model& model, StoredObject (*dictionaryOf)(const MetaRecords&)) {
+    MetaClosure closure(model);
+    for (const BuiltInClass& entry : BuiltInClasses()) {
+        closure.AddClass(entry.id);
+    }
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        closure.AddType(entry.id);
+    }
+    StoredProperty property;
+    property.pid = meta::kRootMetaDictionary;
+    property.form = StoredForm::StrongReference;
+    property.name = u"MetaDictionary";
+    property.objects = {dictionaryOf(closure.records())};
+    StoredObject root;
+    root.properties = {property};
+    return WriteTree(root, SectorSize::Bytes512);
+}
+
+Bytes BytesToSave(const sample::SampleModel& sample, SectorSize size = SectorSize::Bytes512) {
+    return WriteTree(TreeToWrite(*sample.model, *sample.header), size);
+}
+
 }  // namespace
+
+TEST(ModelFile, WhatIsLaidOutOnceGivesTheSameBytes) {
+    for (const SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
+        for (const sample::SampleModel& sample : {sample::WholeModel(), sample::EmptyModel()}) {
+            const Bytes whole = BytesOf(sample, size);
+            EXPECT_EQ(BytesToSave(sample, size), whole);
+            EXPECT_EQ(BytesToSave(sample, size), whole) << "the second time";
+        }
+    }
+}
+
+// A name that was set makes the writer look at the definitions themselves.
+TEST(ModelFile, TheBuiltInTablesSayWhatTheDefinitionsSay) {
+    const RefPtr<Model> renamed = sample::NewModel();
+    for (const BuiltInClass& entry : BuiltInClasses()) {
+        ClassDefinition& definition = *renamed->FindClass(entry.id);
+        definition.SetName(std::wstring(definition.name()).c_str());
+        EXPECT_FALSE(renamed->HasAsBuiltIn(entry));
+    }
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        TypeDefinition& definition = *renamed->FindType(entry.id);
+        definition.SetName(std::wstring(definition.name()).c_str());
+        EXPECT_FALSE(renamed->HasAsBuiltIn(entry));
+    }
+    const RefPtr<Model> untouched = sample::NewModel();
+    const Bytes byDefinitions = DefinitionsIn(*renamed, StoredMetaDictionary);
+    EXPECT_EQ(DefinitionsIn(*untouched, StoredMetaDictionary), byDefinitions);
+    EXPECT_EQ(DefinitionsIn(*untouched, LaidOutMetaDictionary), byDefinitions);
+}
+
+TEST(ModelFile, ABuiltInDefinitionThatACallerChangedIsSavedAsItIs) {
+    const auto change = [](const std::function<void(Model&)>& make) {
+        const sample::SampleModel sample = sample::WholeModel();
+        const Bytes before = BytesToSave(sample);
+        make(*sample.model);
+        const Bytes after = BytesToSave(sample);
+        EXPECT_NE(after, before);
+        EXPECT_EQ(after, BytesOf(sample));
+        EXPECT_EQ(BytesToSave(sample::WholeModel()), before) << "the next file has it unchanged";
+    };
+    change([](Model& model) { model.FindClass(AUID_AAFSourceClip)->SetName(L"Clip"); });
+    change([](Model& model) {
+        model.FindClass(AUID_AAFSourceClip)
+            ->FindProperty(prop::SourceReference_SourceID.id)
+            ->SetName(L"Source");
+    });
+    change([](Model& model) { model.FindType(kAAFTypeID_MobIDType)->SetName(L"Number"); });
+    change([](Model& model) {
+        ClassDefinition& definition = *model.FindClass(AUID_AAFSourceClip);
+        definition.AddProperty(ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E77"), L"More",
+                               kAAFTypeID_UInt8, true, false);
+    });
+    change([](Model& model) {
+        auto& type =
+            dynamic_cast<TypeExtendibleEnumeration&>(*model.FindType(kAAFTypeID_UsageType));
+        type.AppendElement(ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E78"), L"Usage_More");
+    });
+}
 
 TEST(ModelFile, EverythingComesBackFromTheFile) {
     const sample::SampleModel sample = sample::WholeModel();

@@ -61,8 +61,7 @@ TEST_P(TreeRoundTrip, TheFileIsAWholeNumberOfSectorsWithRootClassAndSignature) {
     EXPECT_EQ(reader.signature(), wanted);
 }
 
-// Around 128 sectors of 4096 the container library leaves a sector out that
-// its own header names.
+// Around 127 sectors a table of 512 bytes is full.
 TEST_P(TreeRoundTrip, StreamsOfManySizesKeepTheFileConsistent) {
     for (std::size_t sectors = 118; sectors <= 134; ++sectors) {
         const Bytes content(sectors * 4096 - 1, 0xAB);

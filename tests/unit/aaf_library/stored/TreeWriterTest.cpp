@@ -159,3 +159,54 @@ TEST(TreeWriter, NamesThePlaceOfADeepDefect) {
     const StoredObject tree = sample::RootWith(sample::vector(0x4403, u"Slots", {{}, inner}));
     EXPECT_EQ(refusal(tree), "Slots-4403{1}: property 5001: 70000 bytes, a value may take 65535");
 }
+
+TEST(TreeWriter, AnObjectLaidOutBeforeGivesTheSameBytes) {
+    const std::vector<TargetPath> paths = {{0x0002, 0x3B04, 0x2605}};
+    StoredProperty definition;
+    definition.pid = 0x0201;
+    definition.form = StoredForm::WeakReference;
+    definition.keys = {sample::bytes(sample::auid(7))};
+    definition.keyPid = 0x1B01;
+    definition.targetPath = paths[0];
+    StoredObject whole = sample::EveryForm();
+    whole.properties.clear();
+    whole.properties = {sample::keyed(9).properties[0], definition,
+                        sample::vector(0x4403, u"Slots", {sample::keyed(1), {}})};
+    StoredObject known = whole;
+    known.laidOut = LayOut(whole, paths);
+    ASSERT_NE(known.laidOut, nullptr);
+    known.properties.resize(1);
+    const auto fileWith = [&](const StoredObject& object, SectorSize size) {
+        StoredProperty set = sample::set(0x1901, u"Mobs", {sample::keyed(3)});
+        set.objects.push_back(object);
+        set.keys.push_back(sample::bytes(sample::auid(9)));
+        StoredObject root = sample::RootWith(definition);
+        root.properties.push_back(set);
+        root.properties.push_back(sample::stream(0x2702, u"Data", Bytes(5000, 1)));
+        return WriteTree(root, size);
+    };
+    for (const SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
+        EXPECT_EQ(fileWith(known, size), fileWith(whole, size));
+    }
+}
+
+TEST(TreeWriter, AnObjectWithALongStreamIsNotLaidOutBefore) {
+    const auto holding = [](std::size_t size) {
+        return sample::RootWith(sample::stream(0x2702, u"Data", Bytes(size, 1)));
+    };
+    EXPECT_NE(LayOut(holding(4095), {}), nullptr);
+    EXPECT_EQ(LayOut(holding(4096), {}), nullptr);
+}
+
+TEST(TreeWriter, RefusesAnObjectThatWasLaidOutForOtherTargets) {
+    StoredProperty definition;
+    definition.pid = 0x0201;
+    definition.form = StoredForm::WeakReference;
+    definition.keys = {sample::bytes(sample::auid(7))};
+    definition.targetPath = {2, 3};
+    StoredObject root = sample::RootWith(definition);
+    StoredObject known;
+    known.laidOut = LayOut({}, {{4, 5}});
+    root.properties.push_back(sample::reference(0x4803, u"Segment", known));
+    EXPECT_EQ(refusal(root), "an object was laid out for another table of targets");
+}
