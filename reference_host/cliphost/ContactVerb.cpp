@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <fmt/format.h>
 
-#include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/SheetRun.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
@@ -58,6 +58,7 @@ void CheckPlaces(const MoviesOptions& movies) {
     if (movies.paths.size() != 1 || std::filesystem::is_directory(movies.paths[0])) {
         throw Failure(kExitCaller, "--output", "it takes one movie", "use --out-dir for several");
     }
+    RefuseOutputOntoMovie(movies.file, movies.paths[0]);
     const std::string ending = movies.file.extension().string();
     if (!ending.empty() && ending != ".png") {
         throw Failure(kExitCaller, movies.file,

@@ -22,7 +22,7 @@ public:
     // Before the first read: how large a cell is, in the way up that is stored, and how many
     // frames there will be.
     virtual void Prepare(int width, int height, std::size_t frames) = 0;
-    // May give a picture that is smaller, but not than a cell, and one near to the frame.
+    // May give a picture that has the size of a cell already, and one near to the frame.
     virtual NCFRESULT Read(std::uint64_t frame, Picture& picture) = 0;
 };
 

@@ -63,8 +63,7 @@ private:
     ncfSInt64 lead_ = 0;                   // of decoding before display, where the list tells none
     std::optional<std::size_t> lastSync_;  // that `last_` shows; neighbours often share it
     Thumbnail last_;
-    ThumbnailForm::Matrix matrix_ = ThumbnailForm::Matrix::Own;
-    int divisor_ = 1;
+    ThumbnailForm form_;
     int halvings_ = 0;
     CodecOwner codec_;
     PacketOwner packet_;
@@ -117,13 +116,14 @@ void ThumbnailReader::LearnLead() {
 }
 
 void ThumbnailReader::SetForm(const ThumbnailForm& form) {
-    matrix_ = form.matrix;
-    divisor_ = std::max(1, std::min(source_.width / std::max(1, form.leastWidth),
-                                    source_.height / std::max(1, form.leastHeight)));
-    halvings_ = 0;
+    form_ = form;
+    form_.width = std::clamp(form.width, 1, source_.width);
+    form_.height = std::clamp(form.height, 1, source_.height);
+    const int times = std::min(source_.width / form_.width, source_.height / form_.height);
     const int most = MostHalvings(Stream());
+    halvings_ = 0;
     // Chroma, which may have half the sides, is to stay no smaller than the thumbnail.
-    while (halvings_ < most && 4 << halvings_ <= divisor_) {
+    while (halvings_ < most && 4 << halvings_ <= times) {
         ++halvings_;
     }
     codec_.reset();
@@ -219,24 +219,20 @@ NCFRESULT ThumbnailReader::Read(std::size_t picture, Which which, Thumbnail& thu
 }
 
 bool ThumbnailReader::Write(const AVFrame& frame, Thumbnail& thumbnail) const {
-    SmallPicture picture{source_.width, source_.height};
-    picture.matrix = matrix_ == ThumbnailForm::Matrix::Rec601   ? AVCOL_SPC_SMPTE170M
-                     : matrix_ == ThumbnailForm::Matrix::Rec709 ? AVCOL_SPC_BT709
-                                                                : AVCOL_SPC_UNSPECIFIED;
-    for (const int divisor : {divisor_, 1}) {  // what can't be made smaller is taken as it is
-        picture.width = std::max(1, source_.width / divisor);
-        picture.height = std::max(1, source_.height / divisor);
-        const ncfUInt32 size =
-            PictureBytes(PixelLayout::Bgra8, static_cast<ncfUInt32>(picture.width),
-                         static_cast<ncfUInt32>(picture.height));
-        thumbnail.width = picture.width;
-        thumbnail.height = picture.height;
+    const auto write = [&](int width, int height) {
+        SmallPicture picture{source_.width, source_.height, width, height};
+        picture.matrix = form_.matrix == ThumbnailForm::Matrix::Rec601   ? AVCOL_SPC_SMPTE170M
+                         : form_.matrix == ThumbnailForm::Matrix::Rec709 ? AVCOL_SPC_BT709
+                                                                         : AVCOL_SPC_UNSPECIFIED;
+        const ncfUInt32 size = PictureBytes(PixelLayout::Bgra8, static_cast<ncfUInt32>(width),
+                                            static_cast<ncfUInt32>(height));
+        thumbnail.width = width;
+        thumbnail.height = height;
         thumbnail.bytes.resize(size);
-        if (size != 0 && WriteSmallPicture(frame, picture, thumbnail.bytes.data())) {
-            return true;
-        }
-    }
-    return false;
+        return size != 0 && WriteSmallPicture(frame, picture, thumbnail.bytes.data());
+    };
+    // What can't be made smaller is taken as it is.
+    return write(form_.width, form_.height) || write(source_.width, source_.height);
 }
 
 }  // namespace
@@ -255,8 +251,12 @@ std::unique_ptr<Thumbnails> OpenThumbnails(const std::filesystem::path& movie) {
     const bool canBeRead =
         input && source.width > 0 && source.height > 0 &&
         avcodec_find_decoder(input->streams[source.stream]->codecpar->codec_id) != nullptr;
-    return canBeRead ? std::make_unique<ThumbnailReader>(std::move(source), std::move(input))
-                     : nullptr;
+    if (!canBeRead) {
+        return nullptr;
+    }
+    auto thumbnails = std::make_unique<ThumbnailReader>(std::move(source), std::move(input));
+    thumbnails->SetForm({});
+    return thumbnails;
 }
 
 }  // namespace host

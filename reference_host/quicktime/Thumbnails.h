@@ -4,6 +4,7 @@
 
 #include <cstddef>
 #include <filesystem>
+#include <limits>
 #include <memory>
 #include <vector>
 
@@ -21,9 +22,9 @@ struct Thumbnail {
 
 // How thumbnails are wanted.
 struct ThumbnailForm {
-    // None smaller than this: they are put into cells of this size.
-    int leastWidth = 1;
-    int leastHeight = 1;
+    // None is larger than the movie's pictures are; one that can't be made smaller is as large.
+    int width = std::numeric_limits<int>::max();
+    int height = std::numeric_limits<int>::max();
     // Pictures of one of these matrices are taken for the one that is told, as by those who go by
     // what a format declares.
     enum class Matrix { Own, Rec601, Rec709 };
