@@ -11,9 +11,9 @@
 namespace host {
 namespace {
 
-// Twenty pictures of 1920 x 1080 in 8 bits. Going back through a group that has more, it is
-// decoded again for each twenty.
-constexpr std::size_t kMostCachedBytes = std::size_t{64} << 20;
+// Fifteen pictures of 1920 x 1080 in 8 bits. Going back through a group that has more, it is
+// decoded again for each fifteen.
+constexpr std::size_t kMostCachedBytes = std::size_t{48} << 20;
 // Going forward, memory that was just used is worth more than pictures that
 // were shown already.
 constexpr std::size_t kKeptForward = 4;
@@ -148,6 +148,14 @@ NCFRESULT PictureReader::StartAt(std::size_t packet) {
     return isRunning_ ? NCF_OK : NCF_E_FAIL;
 }
 
+// Whether a picture is shown long before the one that is asked for. On the way forward it is
+// decoded only where others lean on it.
+bool PictureReader::IsPassedOver(std::size_t packet) const {
+    const auto picture = order_.PictureOfPacket(packet);
+    return picture && order_.HasDisplayTimes() && mostKept_ == kKeptForward &&
+           *picture + kKeptForward < lastAsked_;
+}
+
 // Gives the decoder one more packet, or tells it that there are no more.
 bool PictureReader::Feed() {
     if (!isPending_ && av_read_frame(input_.get(), packet_.get()) < 0) {
@@ -159,6 +167,7 @@ bool PictureReader::Feed() {
                                    .value_or(PictureOrder::Found{nextPacket_, false})
                                    .packet;
         nextPacket_ = at + 1;
+        packetsPassed_ += at < runStart_;
         if (at >= runStart_) {
             codec_->reordered_opaque = static_cast<ncfSInt64>(at);
             ++decodedPackets_;
@@ -166,6 +175,7 @@ bool PictureReader::Feed() {
             // next may be good. What is left of one behind a file's end some
             // decoders take for a whole.
             if (!marksCutPackets_ || (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0) {
+                codec_->skip_frame = IsPassedOver(at) ? AVDISCARD_NONREF : AVDISCARD_DEFAULT;
                 if (at < order_.PacketCount() && order_.Packet(at).palette) {
                     PutPalette(*order_.Packet(at).palette, *packet_);
                 }
