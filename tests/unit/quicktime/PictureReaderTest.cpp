@@ -67,7 +67,7 @@ TEST(PictureReader, GivesTheSamePictureAfterAJumpAsInSequence) {
     for (const char* const codec :
          {"libx264 -bf 3 -x264-params b-pyramid=none", "libx264 -bf 3 -flags +ildct+ilme",
           "libx265 -bf 3 -x265-params log-level=none", "mpeg2video -bf 2", "mpeg4 -bf 2",
-           "libx264 -x264-params open-gop=1"}) {
+          "libx264 -x264-params open-gop=1"}) {
         SCOPED_TRACE(codec);
         const MadeMovie movie("-f lavfi -i testsrc2=s=96x64:r=25:d=4 -g 40 -pix_fmt yuv420p -c:v " +
                               std::string(codec));
