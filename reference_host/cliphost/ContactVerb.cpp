@@ -24,9 +24,9 @@ void AddSheetForm(CLI::App& verb, SheetForm& form) {
         ->capture_default_str();
     verb.add_flag(
         "--exact", form.isExact,
-        "Show the frames themselves. Without it, of a movie of more than 250 frames, each "
-        "thumbnail is the nearest picture that is stored whole, so neighbours can be "
-        "the same");
+        "Show the frames themselves. Without it each thumbnail is the nearest picture that "
+        "is stored whole, so neighbours can be the same; only a movie of at most 250 "
+        "frames that has few such pictures is decoded whole");
     form.turn.AddTo(verb);
     form.parameters.AddTo(verb);
 }
