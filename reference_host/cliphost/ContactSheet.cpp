@@ -21,8 +21,12 @@ void PixelAt(const Picture& picture, int x, int y, int (&rgb)[3]) {
                          static_cast<std::size_t>(picture.channels)];
     const int shift = picture.bits - 8;
     const int alpha = picture.channels == 4 ? from[3] >> shift : 255;
-    const int square = std::max(1, picture.width / kSquares);
-    const int behind = ((x / square + y / square) & 1) != 0 ? kDark : kLight;
+    // The same squares for a picture that was made smaller before.
+    const int squares = std::min(kSquares, picture.width);
+    const auto squareAt = [&](int place) {
+        return static_cast<int>(std::int64_t{place} * squares / picture.width);
+    };
+    const int behind = ((squareAt(x) + squareAt(y)) & 1) != 0 ? kDark : kLight;
     for (int c = 0; c < 3; ++c) {
         const int own = from[picture.channels == 1 ? 0 : c] >> shift;
         rgb[c] = (own * alpha + behind * (255 - alpha) + 127) / 255;

@@ -12,6 +12,15 @@
 
 namespace cliphost {
 
+// Edits may show pictures twice, so the number of samples only limits the frames of
+// a movie with one sample, which is delivered for every frame that is asked for.
+std::uint64_t MostFrames(Essence& essence, const ClipTrack& track) {
+    ncfUInt64 samples = 0;
+    const bool isOne =
+        essence.map().GetNumberOfSamples(track.number, &samples) >= 0 && samples <= 1;
+    return isOne ? std::min<std::uint64_t>(track.length, samples) : track.length;
+}
+
 FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::string& formatName)
     : essence_(essence), track_(track), request_(host::MakeRef<host::SampleRequest>()) {
     essence_.NeedDelivery(track_);
@@ -59,15 +68,6 @@ void FrameReader::Choose(const std::string& formatName) {
     throw Failure(kExitCaller, essence_.movie(),
                   fmt::format("track {}: there is no format '{}'", track_.number, formatName),
                   "it offers " + offered);
-}
-
-// Edits may show pictures twice, so the number of samples only limits the frames of
-// a movie with one sample, which is delivered for every frame that is asked for.
-std::uint64_t FrameReader::MostFrames() const {
-    ncfUInt64 samples = 0;
-    const bool isOne =
-        essence_.map().GetNumberOfSamples(track_.number, &samples) >= 0 && samples <= 1;
-    return isOne ? std::min<std::uint64_t>(track_.length, samples) : track_.length;
 }
 
 std::uint64_t FrameReader::Count() {

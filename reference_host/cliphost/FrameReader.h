@@ -13,6 +13,9 @@
 
 namespace cliphost {
 
+// A clip of this track has no frame at or behind this number.
+std::uint64_t MostFrames(Essence& essence, const ClipTrack& track);
+
 // Delivers frames of one picture or alpha track in one of its formats. Owns the
 // request, whose buffer is used for all frames; the essence must outlive it.
 class FrameReader {
@@ -33,8 +36,7 @@ public:
     // Frames of the clip, counted from zero: its length, or the pictures that its
     // edits show where those are fewer. Decodes the last one to know.
     std::uint64_t Count();
-    // No frame is at or behind this number.
-    std::uint64_t MostFrames() const;
+    std::uint64_t MostFrames() const { return cliphost::MostFrames(essence_, track_); }
 
     // NMA_E_NODATA past the last picture, another failure for one that does not
     // decode.

@@ -140,7 +140,7 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
         "           ffplay -f rawvideo -pixel_format uyvy422 -video_size 1920x1080 -framerate 25 "
         "-i -\n"
         "For raw frames, standard error shows pixel format, size and rate.\n"
-        "One process reads all frames; --jobs is for `cliphost describe`.");
+        "One process reads all frames; --jobs is for `cliphost describe` and `cliphost contact`.");
     auto options = std::make_shared<FrameOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();
     verb->add_option("--track", options->track,

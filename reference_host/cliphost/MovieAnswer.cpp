@@ -38,7 +38,7 @@ bool IsRoute(const std::string& text) {
 }  // namespace
 
 MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
-                     const std::function<std::filesystem::path()>& place) {
+                     const PlaceOfFile& place) {
     MovieAnswer answer;
     answer.problem = description.file ? description.doubt : description.problem;
     if (!description.file) {
@@ -84,6 +84,7 @@ std::string ToBytes(const MovieAnswer& answer) {
         .Add(answer.route)
         .Add(answer.routeReason)
         .Add(answer.description)
+        .Add(std::uint64_t{answer.isPartial})
         .bytes();
 }
 
@@ -99,7 +100,9 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     answer.route = fields.Text();
     answer.routeReason = fields.Text();
     answer.description = fields.Text();
-    if (!fields.IsWhole() || status > kExitCaller || !IsRoute(answer.route) ||
+    const std::uint64_t isPartial = fields.Number();
+    answer.isPartial = isPartial != 0;
+    if (!fields.IsWhole() || isPartial > 1 || status > kExitCaller || !IsRoute(answer.route) ||
         !IsRoute(problem.route) || (status != kExitFine && !problem)) {
         return false;
     }

@@ -18,19 +18,24 @@ struct DescriptionForm {
     bool quiet = false;
 };
 
-// What a verb shows of one movie, whichever process described it.
+// What a verb shows of one movie, whichever process read it.
 struct MovieAnswer {
     int status = kExitFine;
     Problem problem;          // why it is not described; or what its header tells wrong
     std::string route;        // for JSON alone
     std::string routeReason;  // empty on the first route
     std::string description;  // text, or JSON indented as part of an entry; empty where not shown
+    bool isPartial = false;   // what was made is saved, though some of it could not be read
 };
+
+// Where what is made of a movie is to be saved, which may be nowhere. Asked once at most; throws a
+// Failure where that is the movie itself.
+using PlaceOfFile = std::function<std::filesystem::path()>;
 
 // Tells on standard error what is told of a movie that is described, saves the description
 // where `place` says, which may be nowhere, and reads it.
 MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
-                     const std::function<std::filesystem::path()>& place);
+                     const PlaceOfFile& place);
 
 // From one process to another. What is read may come from a process that a movie has broken:
 // texts for people are escaped again, and JSON is well-formed; false for anything else.

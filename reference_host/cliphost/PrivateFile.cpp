@@ -2,9 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/PrivateFile.h"
 
-#include <fmt/format.h>
-
 #include <fstream>
+#include <string>
 #include <system_error>
 
 #include "reference_host/cliphost/Failure.h"
@@ -24,7 +23,7 @@ void CopyInto(OutputFile& output, const std::filesystem::path& file) {
 }  // namespace
 
 std::filesystem::path PrivateFile(const std::filesystem::path& folder, std::uint64_t number) {
-    return folder / fmt::format("{}.aaf", number);
+    return folder / std::to_string(number);
 }
 
 void PutIntoPlace(const std::filesystem::path& file, const std::filesystem::path& place) {

@@ -14,6 +14,20 @@ constexpr std::uint64_t kMostSeconds = 1'000'000;
 constexpr std::uint64_t kLeastMebibytes = 64;
 constexpr std::uint64_t kMostMebibytes = 1u << 24;
 
+// What was given of those options that another has, too.
+void AppendGiven(const CLI::App& app, const CLI::App& other, std::vector<std::string>& given) {
+    for (const CLI::Option* const option : app.get_options()) {
+        const std::string name = option->get_name();
+        if (!other.get_option_no_throw(name)) {
+            continue;
+        }
+        const bool takesValue = option->get_items_expected_max() > 0;
+        for (const std::string& value : option->results()) {
+            given.push_back(takesValue ? name + "=" + value : name);
+        }
+    }
+}
+
 }  // namespace
 
 void AddWorkerOptions(CLI::App& verb, WorkerCall& call) {
@@ -38,16 +52,13 @@ void AddWorkerOptions(CLI::App& verb, WorkerCall& call) {
         ->group(group);
 }
 
-std::vector<std::string> GivenOptions(const CLI::App& app) {
-    std::vector<std::string> given;
-    for (const CLI::Option* const option : app.get_options()) {
-        const std::string name = option->get_name();
-        const bool takesValue = option->get_items_expected_max() > 0;
-        for (const std::string& value : option->results()) {
-            given.push_back(takesValue ? name + "=" + value : name);
-        }
-    }
-    return given;
+void TakeWorkerVerb(CLI::App& app, const CLI::App& verb, const std::string& worker,
+                    const SessionOptions& session, WorkerCall& call) {
+    call.program = session.program;
+    call.verbosity = session.verbosity;
+    AppendGiven(app, app, call.arguments);
+    call.arguments.push_back(worker);
+    AppendGiven(verb, *app.get_subcommand(worker), call.arguments);
 }
 
 }  // namespace cliphost

@@ -4,6 +4,7 @@
 
 #include <CLI/CLI.hpp>
 
+#include "reference_host/cliphost/Session.h"
 #include "reference_host/cliphost/Workers.h"
 
 namespace cliphost {
@@ -11,7 +12,9 @@ namespace cliphost {
 // Adds --jobs, --limit-seconds and --limit-memory to a verb.
 void AddWorkerOptions(CLI::App& verb, WorkerCall& call);
 
-// The options that the command line gives before any verb, to be given again.
-std::vector<std::string> GivenOptions(const CLI::App& app);
+// Has the work done by processes of another verb: they are given again what the command line gives
+// before any verb, and what it gives this verb and the other one takes as well.
+void TakeWorkerVerb(CLI::App& app, const CLI::App& verb, const std::string& worker,
+                    const SessionOptions& session, WorkerCall& call);
 
 }  // namespace cliphost

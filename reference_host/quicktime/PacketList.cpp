@@ -24,34 +24,6 @@ bool MayReorder(const AVStream& stream) {
                          AV_CODEC_PROP_INTRA_ONLY;
 }
 
-std::vector<PacketEntry> FromIndex(AVStream& stream) {
-    const int count = avformat_index_get_entries_count(&stream);
-    std::vector<PacketEntry> packets;
-    packets.reserve(static_cast<std::size_t>(std::max(count, 0)));
-    for (int i = 0; i < count; ++i) {
-        const AVIndexEntry* const entry = avformat_index_get_entry(&stream, i);
-        PacketEntry packet;
-        packet.decodeTime = packet.displayTime = UsableTime(entry->timestamp);
-        packet.position = entry->pos;
-        packet.size = static_cast<ncfUInt32>(entry->size);
-        packet.isSync = (entry->flags & AVINDEX_KEYFRAME) != 0;
-        packet.isShown = (entry->flags & AVINDEX_DISCARD_FRAME) == 0;
-        packets.push_back(packet);
-    }
-    for (std::size_t i = 0; i + 1 < packets.size(); ++i) {
-        const ncfSInt64 time = packets[i].decodeTime;
-        const ncfSInt64 next = packets[i + 1].decodeTime;
-        const bool areKnown = time != AV_NOPTS_VALUE && next != AV_NOPTS_VALUE;
-        packets[i].duration = areKnown ? next - time : 0;
-    }
-    if (packets.size() > 1) {
-        packets.back().duration = packets[packets.size() - 2].duration;
-    } else if (packets.size() == 1) {
-        packets.back().duration = UsableDuration(stream.duration);
-    }
-    return packets;
-}
-
 std::shared_ptr<const Palette> PaletteOf(const AVPacket& packet) {
     std::size_t size = 0;
     const std::uint8_t* const colours =
@@ -172,13 +144,41 @@ ncfSInt64 UsableDuration(ncfSInt64 duration) {
     return duration > 0 && duration < kFarthestTime ? duration : 0;
 }
 
+std::vector<PacketEntry> ListByIndex(AVStream& stream) {
+    const int count = avformat_index_get_entries_count(&stream);
+    std::vector<PacketEntry> packets;
+    packets.reserve(static_cast<std::size_t>(std::max(count, 0)));
+    for (int i = 0; i < count; ++i) {
+        const AVIndexEntry* const entry = avformat_index_get_entry(&stream, i);
+        PacketEntry packet;
+        packet.decodeTime = packet.displayTime = UsableTime(entry->timestamp);
+        packet.position = entry->pos;
+        packet.size = static_cast<ncfUInt32>(entry->size);
+        packet.isSync = (entry->flags & AVINDEX_KEYFRAME) != 0;
+        packet.isShown = (entry->flags & AVINDEX_DISCARD_FRAME) == 0;
+        packets.push_back(packet);
+    }
+    for (std::size_t i = 0; i + 1 < packets.size(); ++i) {
+        const ncfSInt64 time = packets[i].decodeTime;
+        const ncfSInt64 next = packets[i + 1].decodeTime;
+        const bool areKnown = time != AV_NOPTS_VALUE && next != AV_NOPTS_VALUE;
+        packets[i].duration = areKnown ? next - time : 0;
+    }
+    if (packets.size() > 1) {
+        packets.back().duration = packets[packets.size() - 2].duration;
+    } else if (packets.size() == 1) {
+        packets.back().duration = UsableDuration(stream.duration);
+    }
+    return packets;
+}
+
 std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool indexIsWhole) {
     AVStream& of = *input.streams[stream];
     std::vector<PacketEntry> indexed;
     bool isInOrder = false;
     std::size_t enough = kPacketsThatTell;
     if (indexIsWhole) {
-        indexed = FromIndex(of);
+        indexed = ListByIndex(of);
         isInOrder = !MayReorder(of);
         if (isInOrder && !MayHavePalette(of)) {
             return indexed;

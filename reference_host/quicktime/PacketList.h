@@ -51,6 +51,10 @@ ncfSInt64 UsableDuration(ncfSInt64 duration);
 // them. Leaves the input at an unknown place.
 std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool indexIsWhole);
 
+// What the index alone tells, of which times of display are no part: those of decoding stand for
+// them.
+std::vector<PacketEntry> ListByIndex(AVStream& stream);
+
 // Whether the first packets of a stream, at most `count`, stand in the file at
 // their positions as they are.
 bool AreStoredPlain(const std::filesystem::path& path, int stream, int count);

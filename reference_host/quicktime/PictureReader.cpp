@@ -6,34 +6,20 @@
 #include <algorithm>
 
 #include "reference_host/quicktime/OpenInput.h"
-#include "reference_host/quicktime/RasterClaim.h"
+#include "reference_host/quicktime/PictureDecoder.h"
 
 namespace host {
 namespace {
 
-constexpr std::size_t kMostCachedBytes = std::size_t{384} << 20;
+// Fifteen pictures of 1920 x 1080 in 8 bits. Going back through a group that has more, it is
+// decoded again for each fifteen.
+constexpr std::size_t kMostCachedBytes = std::size_t{48} << 20;
 // Going forward, memory that was just used is worth more than pictures that
 // were shown already.
 constexpr std::size_t kKeptForward = 4;
 constexpr std::size_t kKeptBackward = 512;
 // A sync sample this near is reached sooner by decoding on than by seeking.
 constexpr std::size_t kNearPackets = 4;
-
-CodecOwner OpenDecoder(const AVStream& stream) {
-    const AVCodec* const decoder = avcodec_find_decoder(stream.codecpar->codec_id);
-    CodecOwner codec = MakeCodec(decoder, *stream.codecpar);
-    if (!codec) {
-        return nullptr;
-    }
-    codec->pkt_timebase = stream.time_base;
-    codec->max_pixels = MostPixels(*stream.codecpar);
-    codec->thread_count = 0;  // as many as there are processors
-    // Near the end of a stream the decoder would keep good pictures back as well;
-    // those that are damaged it marks.
-    codec->flags |= AV_CODEC_FLAG_OUTPUT_CORRUPT;
-    codec->thread_type = FF_THREAD_FRAME | FF_THREAD_SLICE;
-    return avcodec_open2(codec.get(), decoder, nullptr) < 0 ? nullptr : std::move(codec);
-}
 
 // In place of the one that the demuxer gave, which after a seek may be another's.
 void PutPalette(const Palette& palette, AVPacket& packet) {
@@ -47,23 +33,13 @@ void PutPalette(const Palette& palette, AVPacket& packet) {
     }
 }
 
-bool IsDamaged(const AVFrame& frame) {
-    return (frame.flags & AV_FRAME_FLAG_CORRUPT) != 0 || frame.decode_error_flags != 0;
-}
-
 }  // namespace
 
 std::unique_ptr<PictureReader> PictureReader::Open(const std::filesystem::path& path, int stream,
                                                    bool indexIsWhole) {
-    InputOwner input = OpenForStream(path, InputView::AsPresented, stream);
-    if (!input) {
-        return nullptr;
-    }
-    if (TellsLargePictures(*input->streams[stream]->codecpar) &&
-        !FindImpossibleRaster(path, stream).empty()) {
-        return nullptr;
-    }
-    CodecOwner codec = OpenDecoder(*input->streams[stream]);
+    InputOwner input = OpenForPictures(path, stream);
+    CodecOwner codec =
+        input ? OpenPictureDecoder(*input->streams[stream], DecoderUse::EveryPicture) : nullptr;
     if (!codec) {
         return nullptr;
     }
@@ -98,7 +74,7 @@ NCFRESULT PictureReader::Read(std::size_t picture, std::shared_ptr<const AVFrame
         return NMA_E_NODATA;
     }
     if (!codec_) {
-        codec_ = OpenDecoder(*input_->streams[stream_]);
+        codec_ = OpenPictureDecoder(*input_->streams[stream_], DecoderUse::EveryPicture);
     }
     if (!codec_) {
         return NCF_E_FAIL;
@@ -154,10 +130,14 @@ NCFRESULT PictureReader::StartAt(std::size_t packet) {
     const PacketEntry& entry = order_.Packet(packet);
     runStart_ = packet;
     delivered_ = 0;
-    isRunning_ =
-        isSeekable_ && entry.decodeTime != AV_NOPTS_VALUE &&
-        av_seek_frame(input_.get(), stream_, entry.decodeTime, AVSEEK_FLAG_BACKWARD) >= 0 &&
-        LandsBefore(packet);
+    // Most demuxers seek by times of display. By the time of decoding, which is earlier, they
+    // arrive at the sync sample before this one, and all from there would be read for nothing.
+    for (const ncfSInt64 time : {entry.displayTime, entry.decodeTime}) {
+        isRunning_ =
+            isRunning_ || (isSeekable_ && time != AV_NOPTS_VALUE &&
+                           av_seek_frame(input_.get(), stream_, time, AVSEEK_FLAG_BACKWARD) >= 0 &&
+                           LandsBefore(packet));
+    }
     if (!isRunning_) {  // some files can only be read from their start
         if (InputOwner again = OpenForStream(path_, InputView::AsPresented, stream_)) {
             input_ = std::move(again);
@@ -166,6 +146,14 @@ NCFRESULT PictureReader::StartAt(std::size_t packet) {
         }
     }
     return isRunning_ ? NCF_OK : NCF_E_FAIL;
+}
+
+// Whether a picture is shown long before the one that is asked for. On the way forward it is
+// decoded only where others lean on it.
+bool PictureReader::IsPassedOver(std::size_t packet) const {
+    const auto picture = order_.PictureOfPacket(packet);
+    return picture && order_.HasDisplayTimes() && mostKept_ == kKeptForward &&
+           *picture + kKeptForward < lastAsked_;
 }
 
 // Gives the decoder one more packet, or tells it that there are no more.
@@ -179,6 +167,7 @@ bool PictureReader::Feed() {
                                    .value_or(PictureOrder::Found{nextPacket_, false})
                                    .packet;
         nextPacket_ = at + 1;
+        packetsPassed_ += at < runStart_;
         if (at >= runStart_) {
             codec_->reordered_opaque = static_cast<ncfSInt64>(at);
             ++decodedPackets_;
@@ -186,6 +175,7 @@ bool PictureReader::Feed() {
             // next may be good. What is left of one behind a file's end some
             // decoders take for a whole.
             if (!marksCutPackets_ || (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0) {
+                codec_->skip_frame = IsPassedOver(at) ? AVDISCARD_NONREF : AVDISCARD_DEFAULT;
                 if (at < order_.PacketCount() && order_.Packet(at).palette) {
                     PutPalette(*order_.Packet(at).palette, *packet_);
                 }

@@ -36,6 +36,8 @@ public:
 
     // How many packets were decoded so far.
     ncfUInt64 DecodedPackets() const { return decodedPackets_; }
+    // How many were read on the way to where decoding could begin.
+    ncfUInt64 PacketsPassed() const { return packetsPassed_; }
 
 private:
     PictureReader(std::filesystem::path path, InputOwner input, CodecOwner codec, int stream,
@@ -46,6 +48,7 @@ private:
     bool LandsBefore(std::size_t packet);
     NCFRESULT DecodeUpTo(std::size_t picture, std::shared_ptr<const AVFrame>& frame);
     bool Feed();
+    bool IsPassedOver(std::size_t packet) const;
     std::optional<std::size_t> PictureOf(const AVFrame& frame);
 
     std::filesystem::path path_;
@@ -67,6 +70,7 @@ private:
     std::size_t lastAsked_ = 0;
     std::size_t mostKept_ = 0;
     ncfUInt64 decodedPackets_ = 0;
+    ncfUInt64 packetsPassed_ = 0;
 };
 
 }  // namespace host

@@ -1,8 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// `describe --jobs`: the same results as from one process, and what a movie does to the process
-// that reads it costs that movie alone.
+// `--jobs` of the verbs that take several movies: the same results as from one process, and what a
+// movie does to the process that reads it costs that movie alone.
 
 #include <signal.h>
 #include <sys/wait.h>
@@ -153,6 +153,72 @@ TEST_F(EqualJobs, SaveTheSame) {
         EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
         std::filesystem::remove_all(out);
     }
+}
+
+// Among the movies are one without pictures, and one that was cut: its sheet has empty cells.
+TEST_F(EqualJobs, MakeTheSameSheets) {
+    const auto cut =
+        Make("-i " + Quoted(MadeMovie("h264_bframes.mov")) + " -c copy -movflags +faststart",
+             "in/cut.mov");
+    std::filesystem::resize_file(cut, std::filesystem::file_size(cut) * 3 / 4);
+    const std::string form =
+        " --frames 4 --columns 2 --width 32 --exact --set 'Field Layout=Split' ";
+    const std::string paths = In("in") + " " + In("absent.mov") + " " +
+                              Quoted(MadeMovie("png.mov")) + " " +
+                              Quoted(MadeMovie("rotated_90.mov")) + " " +
+                              Quoted(MadeMovie("aac.mov")) + " " + Quoted(MadeMovie("png.mov"));
+    std::set<std::string> names;
+    std::string told;
+    for (const char* const jobs : {"1", "2", "5", "1 --limit-seconds 100"}) {
+        SCOPED_TRACE(jobs);
+        const auto out = folder() / "out";
+        const CommandResult ran =
+            RunCommand("TMPDIR=" + In("tmp") + " " + Program() + " -v contact" + form + paths +
+                       " --jobs " + jobs + " --out-dir " + Quoted(out) + " 2>" + In("told"));
+        EXPECT_EQ(ran.status, 2);
+        const movies::Bytes errors = ReadFile(folder() / "told");
+        const std::string all = ran.out + std::string(errors.begin(), errors.end());
+        EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+        if (names.empty()) {
+            names = NamesIn(out);
+            told = all;
+            EXPECT_EQ(names, (std::set<std::string>{"a\xFF.png", "cut.png", "png-2.png", "png.png",
+                                                    "rotated_90.png"}));
+            EXPECT_NE(told.find("stays empty"), std::string::npos) << told;
+            EXPECT_NE(told.find("it has no picture track"), std::string::npos) << told;
+            std::filesystem::rename(out, folder() / "first");
+            continue;
+        }
+        EXPECT_EQ(all, told);
+        EXPECT_EQ(NamesIn(out), names);
+        for (const std::string& name : names) {
+            EXPECT_EQ(ReadFile(out / name), ReadFile(folder() / "first" / name)) << name;
+        }
+        std::filesystem::remove_all(out);
+    }
+}
+
+TEST_F(Jobs, LoseOneSheetToACrashOrATooLongWait) {
+    for (const char* const name : {"a.mov", "crash.mov", "hang.mov", "z.mov"}) {
+        Copy(name);
+    }
+    const CommandResult ran = Harmed("contact --frames 2 --jobs 2 --limit-seconds 4 " + In("in") +
+                                     " --out-dir " + In("out"));
+    ExpectSays(ran, 1, Line("crash.mov", "the process that read it was ended by signal 11"));
+    ExpectSays(ran, 1, Line("hang.mov", "took longer than 4 seconds"));
+    EXPECT_EQ(NamesIn(folder() / "out"), (std::set<std::string>{"a.png", "z.png"}));
+    EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+}
+
+TEST_F(Jobs, NeedAPlaceForEachSheet) {
+    Copy("a.mov");
+    Copy("b.mov");
+    ExpectSays(RunCliphost("contact " + In("in/a.mov")), 2, "there is no place for the sheet");
+    ExpectSays(RunCliphost("contact " + In("in") + " -o " + In("a.png")), 2, "it takes one movie");
+    ExpectSays(
+        RunCliphost("contact " + In("in/a.mov") + " " + In("in/b.mov") + " -o " + In("a.png")), 2,
+        "it takes one movie");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "a.png"));
 }
 
 TEST_F(Jobs, SaveOneMovieWhereverItIsWanted) {

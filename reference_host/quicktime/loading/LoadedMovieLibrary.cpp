@@ -77,4 +77,8 @@ DisplayMatrix DisplayMatrixOf(const std::filesystem::path& movie) {
     return Library().displayMatrix(movie);
 }
 
+std::unique_ptr<Thumbnails> OpenThumbnails(const std::filesystem::path& movie) {
+    return Library().openThumbnails(movie);
+}
+
 }  // namespace host

@@ -5,6 +5,7 @@
 #include "reference_host/quicktime/DisplayMatrix.h"
 #include "reference_host/quicktime/MovieComponents.h"
 #include "reference_host/quicktime/OpenProblem.h"
+#include "reference_host/quicktime/Thumbnails.h"
 
 namespace host {
 
@@ -21,6 +22,7 @@ struct MovieLibrary {
     CodecProblem (*decoderProblemOfTrack)(const std::filesystem::path&, std::size_t);
     decltype(&RasterProblem) rasterProblem;
     decltype(&DisplayMatrixOf) displayMatrix;
+    decltype(&OpenThumbnails) openThumbnails;
 };
 
 // The one function that it exports, and its name.

@@ -8,12 +8,6 @@
 namespace host {
 namespace {
 
-bool HasOldFullRangeFormat(int format) {
-    return format == AV_PIX_FMT_YUVJ420P || format == AV_PIX_FMT_YUVJ422P ||
-           format == AV_PIX_FMT_YUVJ444P || format == AV_PIX_FMT_YUVJ440P ||
-           format == AV_PIX_FMT_YUVJ411P;
-}
-
 // False for matrices that nobody named or that are not of this kind.
 bool WeightsOf(AVColorSpace space, LumaWeights& weights) {
     switch (space) {
@@ -49,6 +43,17 @@ LumaWeights WeightsForSize(int width, int height) {
     return width < 960 || height < 720 ? kRec601 : kRec709;
 }
 
+bool IsFullRangeByName(AVPixelFormat format) {
+    return format == AV_PIX_FMT_YUVJ420P || format == AV_PIX_FMT_YUVJ422P ||
+           format == AV_PIX_FMT_YUVJ444P || format == AV_PIX_FMT_YUVJ440P ||
+           format == AV_PIX_FMT_YUVJ411P;
+}
+
+bool NamesMatrix(AVColorSpace space) {
+    LumaWeights ignored{};
+    return WeightsOf(space, ignored);
+}
+
 PictureForm::PictureForm(const AVFrame& frame)
     : description(av_pix_fmt_desc_get(static_cast<AVPixelFormat>(frame.format))),
       width(frame.width),
@@ -72,9 +77,9 @@ PictureForm::PictureForm(const AVFrame& frame)
         isGrey = false;
     }
     isRgb = isRgb || isGrey || isPalette;
-    isFullRange =
-        isRgb ? !(isGrey && frame.color_range == AVCOL_RANGE_MPEG)
-              : frame.color_range == AVCOL_RANGE_JPEG || HasOldFullRangeFormat(frame.format);
+    isFullRange = isRgb ? !(isGrey && frame.color_range == AVCOL_RANGE_MPEG)
+                        : frame.color_range == AVCOL_RANGE_JPEG ||
+                              IsFullRangeByName(static_cast<AVPixelFormat>(frame.format));
     switch (frame.chroma_location) {
         case AVCHROMA_LOC_CENTER:
             chromaSiteX = CentreOf(chromaShiftX);

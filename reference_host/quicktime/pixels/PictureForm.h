@@ -24,6 +24,12 @@ inline constexpr LumaWeights kRec709{0.2126, 0.0722};
 // What a picture of this size is taken for when it does not say.
 LumaWeights WeightsForSize(int width, int height);
 
+// Whether it names a matrix that is known; for others the size decides.
+bool NamesMatrix(AVColorSpace space);
+
+// Formats whose names say that they have full range.
+bool IsFullRangeByName(AVPixelFormat format);
+
 // How the numbers of a decoded picture are to be understood.
 struct PictureForm {
     explicit PictureForm(const AVFrame& frame);

@@ -154,6 +154,11 @@ private:
     std::size_t lineBytes_;
 };
 
+// A palette can't be scaled; everything else that can be read keeps its format.
+AVPixelFormat ScalableFormat(AVPixelFormat readable) {
+    return readable == AV_PIX_FMT_PAL8 ? AV_PIX_FMT_BGRA : readable;
+}
+
 AVPixelFormat ReadableFormat(AVPixelFormat format) {
     if (PictureForm::CanRead(format)) {
         return format;
@@ -163,12 +168,26 @@ AVPixelFormat ReadableFormat(AVPixelFormat format) {
     return hasAlpha ? AV_PIX_FMT_RGBA64LE : AV_PIX_FMT_RGB48LE;
 }
 
+// In which small pictures are scaled: eight bits do, and chroma of a large picture that stands
+// for two of its pixels is enough for each of a small one.
+AVPixelFormat SmallFormat(AVPixelFormat stored) {
+    const AVPixelFormat readable = ReadableFormat(stored);
+    const AVPixFmtDescriptor* const found = av_pix_fmt_desc_get(readable);
+    const bool isPlain = (found->flags & (AV_PIX_FMT_FLAG_RGB | AV_PIX_FMT_FLAG_PAL)) != 0 ||
+                         found->nb_components < 3;
+    return isPlain                                       ? ScalableFormat(readable)
+           : (found->flags & AV_PIX_FMT_FLAG_ALPHA) != 0 ? AV_PIX_FMT_YUVA444P
+           : IsFullRangeByName(readable)                 ? AV_PIX_FMT_YUVJ444P
+                                                         : AV_PIX_FMT_YUV444P;
+}
+
 // The picture in another format or size by the library's own conversion.
-FrameOwner Reformed(const AVFrame& frame, AVPixelFormat format, int width, int height) {
+FrameOwner Reformed(const AVFrame& frame, AVPixelFormat format, int width, int height,
+                    int method = SWS_BICUBIC) {
     const auto from = static_cast<AVPixelFormat>(frame.format);
     const ScalerOwner scaler(sws_getContext(frame.width, frame.height, from, width, height, format,
-                                            SWS_BICUBIC | SWS_ACCURATE_RND | SWS_FULL_CHR_H_INT,
-                                            nullptr, nullptr, nullptr));
+                                            method | SWS_ACCURATE_RND | SWS_FULL_CHR_H_INT, nullptr,
+                                            nullptr, nullptr));
     FrameOwner out(av_frame_alloc());
     if (!scaler || !out || av_frame_copy_props(out.get(), &frame) < 0) {
         return nullptr;
@@ -226,9 +245,8 @@ bool WritePicture(const AVFrame& frame, PixelLayout layout, ncfUInt32 width, ncf
         return WritePicture(*behind, layout, width, height, to);
     }
     if (readable != stored || frame.width != wantedWidth || frame.height != wantedHeight) {
-        // A palette can't be scaled; everything else keeps its format.
-        const AVPixelFormat format = readable == AV_PIX_FMT_PAL8 ? AV_PIX_FMT_BGRA : readable;
-        const FrameOwner reformed = Reformed(frame, format, wantedWidth, wantedHeight);
+        const FrameOwner reformed =
+            Reformed(frame, ScalableFormat(readable), wantedWidth, wantedHeight);
         return reformed && WritePicture(*reformed, layout, width, height, to);
     }
     const PictureForm form(frame);
@@ -236,6 +254,31 @@ bool WritePicture(const AVFrame& frame, PixelLayout layout, ncfUInt32 width, ncf
         Writer(frame, form, layout, to).Run();
     }
     return true;
+}
+
+bool WriteSmallPicture(const AVFrame& frame, const SmallPicture& small, std::uint8_t* to) {
+    if (const FrameOwner behind = WithoutInterval(frame, small.fullWidth, small.fullHeight)) {
+        return WriteSmallPicture(*behind, small, to);
+    }
+    const bool isWhole = small.width == small.fullWidth && small.height == small.fullHeight;
+    const FrameOwner picture =
+        isWhole ? FrameOwner(av_frame_clone(&frame))
+                : Reformed(frame, SmallFormat(static_cast<AVPixelFormat>(frame.format)),
+                           small.width, small.height, SWS_AREA);
+    if (!picture) {
+        return false;
+    }
+    // The size of a small one would tell another.
+    if (!NamesMatrix(picture->colorspace)) {
+        picture->colorspace = WeightsForSize(small.fullWidth, small.fullHeight) == kRec709
+                                  ? AVCOL_SPC_BT709
+                                  : AVCOL_SPC_SMPTE170M;
+    }
+    if (small.matrix != AVCOL_SPC_UNSPECIFIED && PictureForm(*picture).isStandardMatrix) {
+        picture->colorspace = small.matrix;
+    }
+    return WritePicture(*picture, PixelLayout::Bgra8, static_cast<ncfUInt32>(small.width),
+                        static_cast<ncfUInt32>(small.height), to);
 }
 
 }  // namespace host

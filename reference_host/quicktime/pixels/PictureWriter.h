@@ -13,4 +13,17 @@ namespace host {
 bool WritePicture(const AVFrame& frame, PixelLayout layout, ncfUInt32 width, ncfUInt32 height,
                   std::uint8_t* to);
 
+struct SmallPicture {
+    int fullWidth;  // of the movie's pictures; the decoder may have given a smaller one already
+    int fullHeight;
+    int width = 0;
+    int height = 0;
+    // Taken for that of pictures in Rec. 601 or 709; unspecified: they keep theirs.
+    AVColorSpace matrix = AVCOL_SPC_UNSPECIFIED;
+};
+
+// The same at a smaller size, in bytes B G R A of full range; each pixel is the mean of what it
+// covers.
+bool WriteSmallPicture(const AVFrame& frame, const SmallPicture& small, std::uint8_t* to);
+
 }  // namespace host

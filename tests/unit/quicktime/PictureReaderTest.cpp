@@ -52,6 +52,55 @@ TEST(PictureReader, JumpsToTheNearestSyncSample) {
     EXPECT_FALSE(frame);
 }
 
+// Luma alone tells pictures apart.
+Bytes Luma(const AVFrame& frame) {
+    Bytes bytes;
+    for (int y = 0; y < frame.height; ++y) {
+        const std::uint8_t* const line = frame.data[0] + std::ptrdiff_t{y} * frame.linesize[0];
+        bytes.insert(bytes.end(), line, line + frame.width);
+    }
+    return bytes;
+}
+
+// Pictures on the way that no other leans on are passed over, which must change nothing.
+TEST(PictureReader, GivesTheSamePictureAfterAJumpAsInSequence) {
+    for (const char* const codec :
+         {"libx264 -bf 3 -x264-params b-pyramid=none", "libx264 -bf 3 -flags +ildct+ilme",
+          "libx265 -bf 3 -x265-params log-level=none", "mpeg2video -bf 2", "mpeg4 -bf 2",
+          "libx264 -x264-params open-gop=1"}) {
+        SCOPED_TRACE(codec);
+        const MadeMovie movie("-f lavfi -i testsrc2=s=96x64:r=25:d=4 -g 40 -pix_fmt yuv420p -c:v " +
+                              std::string(codec));
+        const auto inSequence = Open(movie);
+        const auto jumping = Open(movie);
+        ASSERT_TRUE(inSequence && jumping);
+        std::vector<Bytes> pictures;
+        std::shared_ptr<const AVFrame> frame;
+        for (std::size_t i = 0; i < 100; ++i) {
+            ASSERT_EQ(inSequence->Read(i, frame), NCF_OK) << i;
+            pictures.push_back(Luma(*frame));
+        }
+        for (const std::size_t i :
+             {36u, 37u, 20u, 75u, 99u, 98u, 30u, 31u, 39u, 40u, 79u, 5u, 38u}) {
+            ASSERT_EQ(jumping->Read(i, frame), NCF_OK) << i;
+            EXPECT_EQ(Luma(*frame), pictures[i]) << i;
+        }
+    }
+}
+
+// Reading begins at the sync sample, not a group before it.
+TEST(PictureReader, ReadsNoGroupForNothing) {
+    const MadeMovie movie(
+        "-f lavfi -i testsrc2=s=64x48:r=25:d=20 -c:v libx264 -bf 2 -g 100 -threads 1");
+    const auto reader = Open(movie);
+    ASSERT_TRUE(reader);
+    std::shared_ptr<const AVFrame> frame;
+    for (const std::size_t picture : {301u, 101u, 401u, 201u}) {
+        ASSERT_EQ(reader->Read(picture, frame), NCF_OK);
+        EXPECT_EQ(reader->PacketsPassed(), 0u) << picture;
+    }
+}
+
 TEST(PictureCache, KeepsThoseNearestWithinItsMemory) {
     const MadeMovie movie("-f lavfi -i testsrc2=s=64x48:r=25:d=1 -c:v prores_ks");
     const auto reader = Open(movie);

@@ -1,0 +1,220 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/MoviesRun.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/OutputFolder.h"
+#include "reference_host/cliphost/PrivateFile.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+
+using host::DisplayPath;
+
+template <class Work>
+void MoviesRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work& work) {
+    try {
+        work();
+    } catch (const Failure& failure) {
+        ++failed_;
+        status_ = std::max(status_, failure.status());
+        TellProblem(failure.problem(), session_.verbosity());
+        ShowFailure(movie, failure.problem());
+    } catch (const ReaderGone&) {
+        // It has seen enough.
+    }
+}
+
+int MoviesRun::Run() {
+    std::optional<OutputFolder> folder;
+    if (!options_.outFolder.empty()) {
+        folder.emplace(options_.outFolder);
+    }
+    Plan();
+    const auto movies = std::count_if(steps_.begin(), steps_.end(),
+                                      [](const MovieStep& step) { return step.IsMovie(); });
+    const bool isForWorkers =
+        options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1);
+    if (isForWorkers) {
+        RunInChildren();
+    } else {
+        RunHere();
+    }
+    Finish(done_, failed_);
+    return status_;
+}
+
+void MoviesRun::Plan() {
+    for (const std::filesystem::path& path : options_.paths) {
+        std::error_code ignored;
+        if (!std::filesystem::is_directory(path, ignored)) {
+            steps_.push_back({path.native(), {}, 0, {}, {}});
+            continue;
+        }
+        try {
+            PlanFolder(path);
+        } catch (const Failure& failure) {
+            Refuse(path, failure.status(), failure.problem());
+        }
+    }
+}
+
+void MoviesRun::PlanFolder(const std::filesystem::path& folder) {
+    const auto path = PathForModule(folder);
+    if (!IsClaimed(session_, path.get())) {
+        throw Failure(kExitFile, NotClaimed(folder));
+    }
+    const auto clips = std::make_shared<const FolderClips>(session_, folder);
+    for (const std::filesystem::path& name : clips->others().withBackslash) {
+        Refuse(name, kExitCaller, BackslashProblem(name));
+    }
+    for (const Problem& problem : clips->others().noFiles) {
+        Refuse(problem.subject, kExitCaller, problem);
+    }
+    if (const Problem leftOut = LeftOut(folder, clips->others())) {
+        steps_.push_back({folder.native(), {}, 0, {}, std::make_shared<const Problem>(leftOut)});
+    }
+    for (const FolderClip& clip : clips->clips()) {
+        steps_.push_back({clip.path, clips, clip.index, {}, {}});
+    }
+}
+
+void MoviesRun::Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
+    steps_.push_back({path.native(), {}, 0, std::make_shared<const Failure>(status, problem), {}});
+}
+
+void MoviesRun::RunHere() {
+    if (steps_.size() > 1) {
+        progress_.emplace(doing_, steps_.size());
+    }
+    for (const MovieStep& step : steps_) {
+        if (progress_) {
+            progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
+        }
+        if (!step.IsMovie()) {
+            TellInstead(step);
+            continue;
+        }
+        GoOnAfterFailure(step.movie, [&] {
+            std::filesystem::path saved;
+            const MovieAnswer answer = Answer(step, [&] {
+                saved = options_.Saves() ? TargetFor(step.movie) : std::filesystem::path();
+                return saved;
+            });
+            Settle(step.movie, answer, saved);
+        });
+    }
+    progress_.reset();
+}
+
+void MoviesRun::RunInChildren() {
+    std::vector<std::string> requests;
+    for (std::size_t i = 0; i < steps_.size(); ++i) {
+        if (steps_[i].IsMovie()) {
+            steps_[i].folder.reset();
+            requests.push_back(steps_[i].movie);
+            placesOfRequests_.push_back(i);
+        }
+    }
+    WorkerCall call = options_.workers;
+    if (options_.Saves()) {
+        call.writeNear = options_.outFolder.empty() ? std::filesystem::temp_directory_path()
+                                                    : options_.outFolder;
+    }
+    progress_.emplace(doing_, requests.size());
+    RunInWorkers(call, requests, *this);
+    progress_.reset();
+    TellThoseBefore(steps_.size());
+}
+
+void MoviesRun::TellThoseBefore(std::size_t place) {
+    for (; nextPlace_ < place; ++nextPlace_) {
+        TellInstead(steps_[nextPlace_]);
+    }
+}
+
+void MoviesRun::Begin(std::size_t number) {
+    progress_->Step(
+        DisplayPath(std::filesystem::path(steps_[placesOfRequests_[number]].movie).filename()));
+}
+
+bool MoviesRun::Read(std::size_t number, const std::string& answer) {
+    return ReadAnswer(answer, answers_[number]);
+}
+
+void MoviesRun::Take(std::size_t number, const WorkerResult& result) {
+    const std::size_t place = placesOfRequests_[number];
+    TellThoseBefore(place);
+    ++nextPlace_;
+    Notice("{}", result.told);
+    GoOnAfterFailure(steps_[place].movie, [&] { Deliver(steps_[place], number, result); });
+    answers_.erase(number);
+}
+
+void MoviesRun::Deliver(const MovieStep& step, std::size_t number, const WorkerResult& result) {
+    if (!result.failure.empty()) {
+        throw Failure(kExitFile, step.movie, result.failure);
+    }
+    MovieAnswer& answer = answers_[number];
+    std::filesystem::path saved;
+    if (options_.Saves()) {
+        const std::filesystem::path file = PrivateFile(result.folder, number);
+        const bool isSaved = answer.status == kExitFine;
+        const bool isNotSaved = !isSaved && answer.problem.subject == file;
+        saved = isSaved || isNotSaved ? TargetFor(step.movie) : saved;
+        if (isNotSaved) {
+            answer.problem.subject = saved;
+        } else if (isSaved) {
+            PutIntoPlace(file, saved);
+        }
+    }
+    Settle(step.movie, answer, saved);
+}
+
+void MoviesRun::TellInstead(const MovieStep& step) {
+    if (step.notice) {
+        TellProblem(*step.notice, session_.verbosity());
+    } else {
+        GoOnAfterFailure(step.movie, [&] { throw *step.refusal; });
+    }
+}
+
+void MoviesRun::Settle(const std::filesystem::path& movie, const MovieAnswer& answer,
+                       const std::filesystem::path& saved) {
+    if (answer.status != kExitFine) {
+        throw Failure(answer.status, answer.problem);
+    }
+    ++done_;
+    status_ = std::max(status_, answer.isPartial ? kExitFile : kExitFine);
+    Show(movie, answer, saved);
+}
+
+std::filesystem::path MoviesRun::TargetFor(const std::filesystem::path& movie) {
+    std::filesystem::path target = options_.file;
+    // Movies of one name in different folders get numbers.
+    for (int number = 1; target.empty(); ++number) {
+        std::filesystem::path name = movie.stem();
+        name += number == 1 ? ending_ : fmt::format("-{}{}", number, ending_);
+        const std::filesystem::path free = options_.outFolder / name;
+        if (targetsTaken_.insert(free).second) {
+            target = free;
+        }
+    }
+    std::error_code ignored;
+    if (!std::filesystem::exists(target, ignored)) {
+        return target;  // so it is no movie
+    }
+    RefuseOutputOntoMovie(target, movie);
+    for (const std::filesystem::path& other : options_.paths) {
+        RefuseOutputOntoMovie(target, other);
+    }
+    return target;
+}
+
+}  // namespace cliphost

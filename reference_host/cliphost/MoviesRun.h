@@ -1,0 +1,99 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <map>
+#include <memory>
+#include <optional>
+#include <set>
+#include <string>
+#include <vector>
+
+#include "reference_host/cliphost/FolderClips.h"
+#include "reference_host/cliphost/MovieAnswer.h"
+#include "reference_host/cliphost/Progress.h"
+#include "reference_host/cliphost/Workers.h"
+
+namespace cliphost {
+
+struct MoviesOptions {
+    std::vector<std::filesystem::path> paths;  // movies and folders
+    std::filesystem::path file;                // for what is made of the only movie
+    std::filesystem::path outFolder;           // for what is made of each
+    WorkerCall workers;                        // without `writeNear`
+
+    bool Saves() const { return !file.empty() || !outFolder.empty(); }
+};
+
+// One movie of a command line, or what is told in its place.
+struct MovieStep {
+    std::filesystem::path::string_type movie;   // as in FolderClip
+    std::shared_ptr<const FolderClips> folder;  // where it is out of a list
+    ncfSInt32 index = 0;                        // in that
+    std::shared_ptr<const Failure> refusal;     // it can't be asked for
+    std::shared_ptr<const Problem> notice;      // no movie is meant
+
+    bool IsMovie() const { return !refusal && !notice; }
+};
+
+// What a verb does with all movies of the command line; a bad one does not stop the rest. Several
+// are given to processes of their own where the options say so.
+class MoviesRun : private WorkerClient {
+public:
+    virtual ~MoviesRun() = default;
+    int Run();
+
+protected:
+    // `doing` is shown beside the progress; files in the folder get the ending.
+    MoviesRun(Session& session, const MoviesOptions& options, const char* doing, const char* ending)
+        : session_(session), options_(options), doing_(doing), ending_(ending) {}
+
+    // Does the work in this process; what it makes is saved where `place` says.
+    virtual MovieAnswer Answer(const MovieStep& step, const PlaceOfFile& place) = 0;
+    // Reads what a child process answered; false for what is no answer.
+    virtual bool ReadAnswer(const std::string& bytes, MovieAnswer& answer) = 0;
+    // Both come in the order of the command line.
+    virtual void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
+                      const std::filesystem::path& saved) = 0;
+    virtual void ShowFailure(const std::filesystem::path&, const Problem&) {}
+    // After all.
+    virtual void Finish(int /*done*/, int /*failed*/) {}
+
+    Session& session() { return session_; }
+
+private:
+    void Plan();
+    void PlanFolder(const std::filesystem::path& folder);
+    void Refuse(const std::filesystem::path& path, int status, const Problem& problem);
+    void RunHere();
+    void RunInChildren();
+    void TellInstead(const MovieStep& step);
+    void TellThoseBefore(std::size_t place);
+    void Begin(std::size_t number) override;
+    bool Read(std::size_t number, const std::string& answer) override;
+    void Take(std::size_t number, const WorkerResult& result) override;
+    void Deliver(const MovieStep& step, std::size_t number, const WorkerResult& result);
+    void Settle(const std::filesystem::path& movie, const MovieAnswer& answer,
+                const std::filesystem::path& saved);
+    // Does one movie; what it fails with is told, and the next one goes on.
+    template <class Work>
+    void GoOnAfterFailure(const std::filesystem::path& movie, const Work& work);
+    std::filesystem::path TargetFor(const std::filesystem::path& movie);
+
+    Session& session_;
+    const MoviesOptions& options_;
+    const char* doing_;
+    const char* ending_;
+    std::vector<MovieStep> steps_;
+    std::vector<std::size_t> placesOfRequests_;  // among the steps
+    std::size_t nextPlace_ = 0;
+    std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
+    std::optional<Progress> progress_;
+    std::set<std::filesystem::path> targetsTaken_;
+    int done_ = 0;
+    int failed_ = 0;
+    int status_ = kExitFine;  // the highest of all failures
+};
+
+}  // namespace cliphost

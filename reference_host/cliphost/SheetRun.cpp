@@ -1,0 +1,96 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/SheetRun.h"
+
+#include <fmt/format.h>
+
+#include <cmath>
+
+#include "reference_host/cliphost/ContactSheet.h"
+#include "reference_host/cliphost/FrameRange.h"
+#include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/PngFile.h"
+#include "reference_host/cliphost/SheetPictures.h"
+#include "reference_host/cliphost/Words.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+// Cells have the shape in which the clip is shown, whatever its pixels are.
+int CellHeight(const SheetForm& form, const ClipTrack& track, const SheetPictures& pictures,
+               const PictureTurn& turn) {
+    const aafRational_t& shape = track.shape;
+    const double stored = shape.denominator > 0 && shape.numerator > 0
+                              ? static_cast<double>(shape.denominator) / shape.numerator
+                              : static_cast<double>(pictures.height()) / pictures.width();
+    const double shown = turn.swapsSides ? 1.0 / stored : stored;
+    const double height = form.width * std::clamp(shown, 0.05, 20.0);
+    return std::max(1, static_cast<int>(std::lround(height)));
+}
+
+// Parameters change the levels of what the module delivers.
+std::unique_ptr<SheetPictures> PicturesFor(Essence& essence, const ClipTrack& track,
+                                           const SheetForm& form) {
+    auto small = form.parameters.IsEmpty() ? SmallPictures(essence, track, form.isExact) : nullptr;
+    return small ? std::move(small) : DeliveredPictures(essence, track);
+}
+
+}  // namespace
+
+MovieAnswer MakeSheet(Session& session, const std::filesystem::path& movie, const SheetForm& form,
+                      const PlaceOfFile& place) {
+    const std::filesystem::path file = place();
+    Essence essence = OpenEssence(session, movie, form.parameters);
+    const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
+    const auto pictures = PicturesFor(essence, track, form);
+    const auto frames = SpreadFrames(pictures->Count(), static_cast<std::uint64_t>(form.frames));
+    if (frames.empty()) {
+        throw Failure(kExitFile, essence.WhyUnread(track, 0, NMA_E_NODATA));
+    }
+    if (pictures->width() == 0) {
+        throw Failure(kExitFile, movie, "its pictures have no size");
+    }
+    const PictureTurn turn = form.turn.TurnFor(movie);
+    const int cellHeight = CellHeight(form, track, *pictures, turn);
+    ContactSheet sheet(static_cast<int>(frames.size()), form.columns, form.width, cellHeight);
+    pictures->Prepare(turn.swapsSides ? cellHeight : form.width,
+                      turn.swapsSides ? form.width : cellHeight, frames.size());
+    std::optional<Progress> progress;
+    if (form.showsProgress) {
+        progress.emplace("frames", frames.size());
+    }
+    std::size_t failed = 0;
+    for (const std::uint64_t frame : frames) {
+        if (progress) {
+            progress->Step(fmt::format("{}", frame));
+        }
+        Picture picture;  // of a frame that can't be read its cell stays empty
+        const NCFRESULT result = pictures->Read(frame, picture);
+        if (result != NCF_OK) {
+            ++failed;
+            Problem problem = essence.WhyUnread(track, frame, result);
+            problem.reason = fmt::format("frame {} stays empty: {}", frame, problem.reason);
+            TellProblem(problem, session.verbosity());
+        }
+        sheet.Add(Turned(std::move(picture), turn));
+    }
+    if (failed == frames.size()) {
+        throw Failure(kExitFile, movie, "no frame could be read, so there is no sheet");
+    }
+    WriteWholeFile(file, ToPng(sheet.picture()));
+    MovieAnswer answer;
+    answer.description =
+        fmt::format("{} of {}", frames.size() - failed, Counted(pictures->Count(), "frame"));
+    answer.isPartial = failed > 0;
+    return answer;
+}
+
+void SheetRun::Show(const std::filesystem::path&, const MovieAnswer& answer,
+                    const std::filesystem::path& saved) {
+    if (!host::system::IsStandardOutput(saved)) {
+        fmt::print("{}: {}\n", host::DisplayPath(saved), answer.description);
+    }
+}
+
+}  // namespace cliphost

@@ -1,0 +1,63 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/WorkerVerb.h"
+
+#include "host_interfaces/quicktime/QuickTimeProperty.h"
+#include "reference_host/cliphost/PrivateFile.h"
+#include "reference_host/cliphost/Workers.h"
+#include "reference_host/quicktime/MovieComponents.h"
+
+namespace cliphost {
+namespace {
+
+MovieAnswer Failed(int status, Problem problem) {
+    MovieAnswer answer;
+    answer.status = status;
+    answer.problem = std::move(problem);
+    return answer;
+}
+
+// One movie's answer, whatever happens to it.
+MovieAnswer AnswerSafely(const std::filesystem::path& movie, const PlaceOfFile& place,
+                         const AnswerToMovie& answer) {
+    try {
+        return answer(movie, place);
+    } catch (const Failure& failure) {
+        return Failed(failure.status(), failure.problem());
+    } catch (const host::MovieLibraryMissing& missing) {
+        return Failed(kExitCaller,
+                      {movie, missing.what(), "install cliphost anew, with all its files"});
+    } catch (const std::exception& error) {
+        return Failed(kExitFile, {movie, error.what()});
+    }
+}
+
+}  // namespace
+
+CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker) {
+    CLI::App* const verb = app.add_subcommand(worker->name, "Work for another cliphost");
+    verb->group("");  // not for users
+    // Lives as long as the verb.
+    verb->add_option_function<std::filesystem::path>(
+        "--folder", [worker](const std::filesystem::path& folder) { worker->folder = folder; });
+    return verb;
+}
+
+void ServeMovies(Session& session, const WorkerVerb& worker, const AnswerToMovie& answer) {
+    // Loads the multimedia library, which can't be done later.
+    host::Ref<QuickTime::IQuickTimeProperty> property;
+    session.host().Create(QuickTime::CompID_QuickTimeProperty, property);
+    const auto serve = [&](std::uint64_t number, const std::string& movie) {
+        const PlaceOfFile place = [&] {
+            return worker.folder.empty() ? std::filesystem::path()
+                                         : PrivateFile(worker.folder, number);
+        };
+        return ToBytes(AnswerSafely(movie, place, answer));
+    };
+    if (!ServeAsWorker(worker.folder, serve)) {
+        throw Failure(kExitCaller, worker.name, "only cliphost itself starts this",
+                      "use `cliphost " + worker.users + "`");
+    }
+}
+
+}  // namespace cliphost

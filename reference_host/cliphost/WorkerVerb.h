@@ -1,0 +1,30 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <CLI/CLI.hpp>
+
+#include "reference_host/cliphost/MovieAnswer.h"
+#include "reference_host/cliphost/Session.h"
+
+namespace cliphost {
+
+// The verb that the child processes of another verb are started as.
+struct WorkerVerb {
+    std::string name;
+    std::string users;                  // the verb that users call
+    std::filesystem::path folder = {};  // that it may write, empty: none
+};
+
+// Adds it, with its folder as an option and hidden from users; both share `worker`.
+CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker);
+
+// Makes of one movie what the verb makes, and saves it where the place says.
+using AnswerToMovie =
+    std::function<MovieAnswer(const std::filesystem::path& movie, const PlaceOfFile& place)>;
+
+// Answers the parent's requests, each a movie's path, whatever happens to one. Throws a Failure
+// when no parent started this process.
+void ServeMovies(Session& session, const WorkerVerb& worker, const AnswerToMovie& answer);
+
+}  // namespace cliphost
