@@ -16,6 +16,7 @@ namespace cliphost {
 namespace {
 
 constexpr int kDeepest = 32;  // objects inside objects
+constexpr std::size_t kUsualFacts = 12;
 
 // The names of definitions, each asked for once.
 template <class Definition>
@@ -38,10 +39,13 @@ private:
     std::unordered_map<Definition*, Named> names_;
 };
 
+// The order of properties is the library's affair; ours is by name.
 template <class Item>
-void SortByName(std::vector<Item>& items) {
-    std::stable_sort(items.begin(), items.end(),
-                     [](const Item& a, const Item& b) { return a.name < b.name; });
+void InsertByName(Item item, std::vector<Item>& items) {
+    const auto place =
+        std::upper_bound(items.begin(), items.end(), item,
+                         [](const Item& a, const Item& b) { return a.name < b.name; });
+    items.insert(place, std::move(item));
 }
 
 class TreeReader {
@@ -66,13 +70,11 @@ TreeNode TreeReader::Read(IAAFObject* object, int depth) {
     if (depth > kDeepest || object->GetProperties(properties.Out()) < 0) {
         return node;
     }
+    node.facts.reserve(kUsualFacts);
     host::Ref<IAAFProperty> property;
     while (properties->NextOne(property.Out()) >= 0) {
         ReadProperty(*property, depth, node);
     }
-    // The order of properties is the library's affair; ours is by name.
-    SortByName(node.facts);
-    SortByName(node.branches);
     return node;
 }
 
@@ -89,9 +91,9 @@ void TreeReader::ReadProperty(IAAFProperty& property, int depth, TreeNode& node)
     std::vector<TreeNode> parts;
     if (values_.TakeObjects(
             value.get(), [&](IAAFObject* object) { parts.push_back(Read(object, depth + 1)); })) {
-        node.branches.push_back({name, std::move(parts)});
+        InsertByName(TreeNode::Branch{name, std::move(parts)}, node.branches);
     } else if (name != "ObjClass") {
-        node.facts.push_back({name, values_.Text(value.get())});
+        InsertByName(TreeNode::Fact{name, values_.Text(value.get())}, node.facts);
     }
 }
 

@@ -5,6 +5,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <vector>
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
@@ -183,12 +184,12 @@ public:
         if (as()->GetCount(value, &count) < 0 || count > 0x100000) {
             return kUnreadable;
         }
-        std::wstring wide(count + 1, L'\0');
+        WideBuffer wide(count);
         if (as()->GetElements(value, reinterpret_cast<aafMemPtr_t>(wide.data()),
                               static_cast<aafUInt32>(count * sizeof(wchar_t))) < 0) {
             return kUnreadable;
         }
-        return '"' + Utf8(wide.c_str()) + '"';
+        return '"' + Utf8(wide.data()) + '"';
     }
 };
 
@@ -442,13 +443,43 @@ std::unique_ptr<ValueType> MakeType(ValueReader& reader, const host::Ref<IAAFTyp
 }  // namespace
 
 std::string Utf8(std::wstring_view wide) {
+    if (std::all_of(wide.begin(), wide.end(), [](wchar_t c) { return (c & ~0x7F) == 0; })) {
+        std::string text(wide.size(), '\0');
+        std::transform(wide.begin(), wide.end(), text.begin(),
+                       [](wchar_t c) { return static_cast<char>(c); });
+        return text;
+    }
     return encodings::ToUtf8Lossy(encodings::FromWide(wide));
 }
 
+namespace {
+
+constexpr char kUpper[] = "0123456789ABCDEF";
+constexpr char kLower[] = "0123456789abcdef";
+
+// Two digits for each of the bytes, which are what the numbers end in.
+void AppendHex(const char* digits, std::initializer_list<unsigned> bytes, std::string& text) {
+    for (const unsigned byte : bytes) {
+        text += digits[byte >> 4 & 15];
+        text += digits[byte & 15];
+    }
+}
+
+}  // namespace
+
 std::string ToText(const aafUID_t& id) {
-    return fmt::format("{{{:08X}-{:04X}-{:04X}-{:02X}{:02X}-{:02X}{:02X}{:02X}{:02X}{:02X}{:02X}}}",
-                       id.Data1, id.Data2, id.Data3, id.Data4[0], id.Data4[1], id.Data4[2],
-                       id.Data4[3], id.Data4[4], id.Data4[5], id.Data4[6], id.Data4[7]);
+    const unsigned char* const node = id.Data4;
+    std::string text = "{";
+    AppendHex(kUpper, {id.Data1 >> 24, id.Data1 >> 16, id.Data1 >> 8, id.Data1}, text);
+    text += '-';
+    AppendHex(kUpper, {unsigned{id.Data2} >> 8, id.Data2}, text);
+    text += '-';
+    AppendHex(kUpper, {unsigned{id.Data3} >> 8, id.Data3}, text);
+    text += '-';
+    AppendHex(kUpper, {node[0], node[1]}, text);
+    text += '-';
+    AppendHex(kUpper, {node[2], node[3], node[4], node[5], node[6], node[7]}, text);
+    return text + '}';
 }
 
 // SMPTE ST 330: 32 bytes in groups of four.
@@ -464,14 +495,12 @@ std::string ToText(const aafMobID_t& id) {
         bytes.push_back(static_cast<unsigned char>(part));
     }
     bytes.insert(bytes.end(), m.Data4, m.Data4 + 8);
-    static constexpr char kDigits[] = "0123456789abcdef";
     std::string text = "urn:smpte:umid:";
     for (std::size_t i = 0; i < bytes.size(); ++i) {
         if (i > 0 && i % 4 == 0) {
             text += '.';
         }
-        text += kDigits[bytes[i] >> 4];
-        text += kDigits[bytes[i] & 15];
+        AppendHex(kLower, {bytes[i]}, text);
     }
     return text;
 }
@@ -484,7 +513,7 @@ std::string ToText(const aafTimeStamp_t& time) {
 }
 
 std::string ToText(const aafRational_t& rational) {
-    return fmt::format("{}/{}", rational.numerator, rational.denominator);
+    return std::to_string(rational.numerator) + '/' + std::to_string(rational.denominator);
 }
 
 std::string ToText(const aafVersionType_t& version) {

@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/JsonText.h"
 
 #include <algorithm>
+#include <array>
 #include <nlohmann/json.hpp>
 
 #include "text/Encodings.h"
@@ -12,9 +13,16 @@ namespace {
 
 constexpr std::size_t kDeepest = 1024;  // objects and lists in one another
 
-// A character of ASCII that stands in JSON for itself.
+// The characters of ASCII that stand in JSON for themselves.
+constexpr auto kPlain = [] {
+    std::array<bool, 256> plain{};
+    for (unsigned char c = ' '; c <= '~'; ++c) {
+        plain[c] = c != '"' && c != '\\';
+    }
+    return plain;
+}();
 bool IsPlain(char c) {
-    return c >= ' ' && c <= '~' && c != '"' && c != '\\';
+    return kPlain[static_cast<unsigned char>(c)];
 }
 
 // Goes through a text from its start to its end.
@@ -84,7 +92,8 @@ private:
         }
         const char* const start = at_;
         bool isAscii = true;
-        for (; at_ != end_ && *at_ != '"'; ++at_) {
+        for (at_ = std::find_if_not(at_, end_, IsPlain); at_ != end_ && *at_ != '"';
+             at_ = std::find_if_not(at_ + 1, end_, IsPlain)) {
             if (*at_ == '\\' && !TakeEscaped()) {
                 return false;
             }
@@ -123,13 +132,24 @@ private:
 }  // namespace
 
 void AppendJsonText(std::string_view text, std::string& json) {
-    if (std::all_of(text.begin(), text.end(), IsPlain)) {
-        json += '"';
-        json += text;
-        json += '"';
-    } else {
-        json += nlohmann::json(text).dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
+    const std::size_t before = json.size();
+    json += '"';
+    for (auto at = text.begin(); at != text.end();) {
+        const auto end = std::find_if_not(at, text.end(), IsPlain);
+        json.append(at, end);
+        at = end;
+        if (at != text.end()) {
+            if (*at != '"' && *at != '\\') {  // controls, and what may be no text at all
+                json.resize(before);
+                json += nlohmann::json(text).dump(-1, ' ', false,
+                                                  nlohmann::json::error_handler_t::replace);
+                return;
+            }
+            json += '\\';
+            json += *at++;
+        }
     }
+    json += '"';
 }
 
 bool IsJsonOfTexts(std::string_view json) {
