@@ -32,6 +32,14 @@ const GUID* TargetClassOf(const TypeDefinition& type) {
     return reference == nullptr ? nullptr : &reference->targetClass();
 }
 
+// The bytes of an object's key; empty when it has none.
+const Bytes& KeyOf(const Object& object) {
+    static const Bytes none;
+    const PropertyDefinition* property = object.classDefinition().FindUniqueProperty();
+    const PropertyValue* value = property == nullptr ? nullptr : object.FindValue(property->key());
+    return value == nullptr ? none : value->bytes();
+}
+
 }  // namespace
 
 HRESULT Object::PutObject(const PropertyKey& key, IUnknown* argument) {
@@ -125,9 +133,7 @@ HRESULT Object::RemoveObject(const PropertyKey& key, IUnknown* argument) {
 }
 
 Bytes Object::UniqueKey() const {
-    const PropertyDefinition* property = class_->FindUniqueProperty();
-    const PropertyValue* value = property == nullptr ? nullptr : FindValue(property->key());
-    return value == nullptr ? Bytes() : value->bytes();
+    return KeyOf(*this);
 }
 
 HRESULT Object::AddToSet(const PropertyKey& key, IUnknown* argument) {
@@ -144,10 +150,10 @@ HRESULT Object::AddToSet(const PropertyKey& key, IUnknown* argument) {
     }
     const Bytes added = object->UniqueKey();
     const auto& elements = value->objects();
-    const auto place = std::lower_bound(
-        elements.begin(), elements.end(), added,
-        [](const RefPtr<Object>& at, const Bytes& id) { return at->UniqueKey() < id; });
-    if (place != elements.end() && (*place)->UniqueKey() == added) {
+    const auto place =
+        std::lower_bound(elements.begin(), elements.end(), added,
+                         [](const RefPtr<Object>& at, const Bytes& id) { return KeyOf(*at) < id; });
+    if (place != elements.end() && KeyOf(**place) == added) {
         return AAFRESULT_OBJECT_ALREADY_ATTACHED;
     }
     return value->InsertObject(static_cast<std::size_t>(place - elements.begin()), object);
@@ -161,10 +167,10 @@ Object* Object::FindInSet(const PropertyKey& key, const void* keyBytes, std::siz
     const auto* first = static_cast<const std::uint8_t*>(keyBytes);
     const Bytes wanted(first, first + size);
     const auto& elements = value->objects();
-    const auto place = std::lower_bound(
-        elements.begin(), elements.end(), wanted,
-        [](const RefPtr<Object>& at, const Bytes& id) { return at->UniqueKey() < id; });
-    return place != elements.end() && (*place)->UniqueKey() == wanted ? place->get() : nullptr;
+    const auto place =
+        std::lower_bound(elements.begin(), elements.end(), wanted,
+                         [](const RefPtr<Object>& at, const Bytes& id) { return KeyOf(*at) < id; });
+    return place != elements.end() && KeyOf(**place) == wanted ? place->get() : nullptr;
 }
 
 void Object::SortSet(const PropertyKey& key) {

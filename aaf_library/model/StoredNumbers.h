@@ -9,9 +9,11 @@ namespace aaf {
 // Numbers and ids as stored values hold them: little-endian, without padding.
 
 inline void AppendNumber(std::uint64_t value, std::size_t size, Bytes& out) {
-    for (std::size_t i = 0; i < size; ++i) {
-        out.push_back(static_cast<std::uint8_t>(value >> (8 * i)));
+    std::uint8_t bytes[sizeof value];
+    for (std::size_t i = 0; i < sizeof value; ++i) {
+        bytes[i] = static_cast<std::uint8_t>(value >> (8 * i));
     }
+    out.insert(out.end(), bytes, bytes + size);
 }
 
 inline std::uint64_t UnsignedAt(const std::uint8_t* at, std::size_t size) {

@@ -3,27 +3,53 @@
 #include "aaf_library/model/Text.h"
 
 #include <algorithm>
+#include <cstring>
+#include <string_view>
 
 #include "host_interfaces/aaf/AAFResultCodes.h"
 #include "text/Encodings.h"
 
 namespace aaf {
 
+namespace {
+
+// Characters that are one unit of every encoding, and the same number.
+template <class Text>
+bool IsAscii(const Text& text) {
+    return std::all_of(text.begin(), text.end(), [](auto c) { return (c & ~0x7F) == 0; });
+}
+
+template <class Units>
+void AppendUnits(const Units& units, Bytes& out) {
+    const std::size_t before = out.size();
+    out.resize(before + 2 * units.size());
+    auto* to = out.data() + before;
+    for (const auto unit : units) {
+        *to++ = static_cast<std::uint8_t>(unit);
+        *to++ = static_cast<std::uint8_t>(unit >> 8);
+    }
+}
+
+}  // namespace
+
 void AppendUtf16(const aafCharacter* text, std::size_t count, Bytes& out) {
-    out.reserve(out.size() + 2 * count);
-    for (const char16_t unit : encodings::ToUtf16Lossy(encodings::FromWide({text, count}))) {
-        out.push_back(static_cast<std::uint8_t>(unit));
-        out.push_back(static_cast<std::uint8_t>(unit >> 8));
+    const std::wstring_view wide(text, count);
+    if (IsAscii(wide)) {
+        AppendUnits(wide, out);
+    } else {
+        AppendUnits(encodings::ToUtf16Lossy(encodings::FromWide(wide)), out);
     }
 }
 
 std::wstring FromUtf16(const std::uint8_t* bytes, std::size_t size) {
-    std::u16string units;
-    units.reserve(size / 2);
-    for (std::size_t at = 0; at + 1 < size; at += 2) {
-        units.push_back(static_cast<char16_t>(bytes[at] | bytes[at + 1] << 8));
+    std::wstring text(size / 2, L'\0');
+    for (wchar_t& unit : text) {
+        unit = static_cast<wchar_t>(bytes[0] | bytes[1] << 8);
+        bytes += 2;
     }
-    return encodings::ToWideLossy(encodings::FromUtf16(units));
+    return IsAscii(text) ? text
+                         : encodings::ToWideLossy(
+                               encodings::FromUtf16(std::u16string(text.begin(), text.end())));
 }
 
 Bytes StoredText(const std::wstring& text) {
@@ -39,11 +65,7 @@ std::wstring TextOfStored(const Bytes& bytes) {
 }
 
 std::wstring Widen(const char* ascii) {
-    std::wstring text;
-    for (; *ascii != '\0'; ++ascii) {
-        text.push_back(static_cast<wchar_t>(*ascii));
-    }
-    return text;
+    return {ascii, ascii + std::strlen(ascii)};
 }
 
 HRESULT CopyText(const std::wstring& text, aafCharacter* buffer, aafUInt32 bufferBytes) {

@@ -10,12 +10,19 @@
 namespace aaf {
 
 bool WeakKeyOf(Unknown& target, GUID* id) {
-    if (auto* definition = dynamic_cast<MetaDefinition*>(&target)) {
-        *id = definition->id();
+    if (auto* object = dynamic_cast<DefinitionObject*>(&target)) {
+        const PropertyValue* value = object->FindValue(prop::DefinitionObject_Identification);
+        if (value == nullptr || value->bytes().size() != kGuidSize) {
+            return false;
+        }
+        *id = GuidAt(value->bytes().data());
         return true;
     }
-    auto* object = dynamic_cast<DefinitionObject*>(&target);
-    return object != nullptr && object->ReadStruct(prop::DefinitionObject_Identification, id) >= 0;
+    auto* definition = dynamic_cast<MetaDefinition*>(&target);
+    if (definition != nullptr) {
+        *id = definition->id();
+    }
+    return definition != nullptr;
 }
 
 HRESULT TypeReference::SetupTarget(const GUID& id, const std::wstring& name,

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <algorithm>
+#include <iterator>
 #include <string>
 #include <string_view>
 
@@ -27,6 +29,25 @@ host::Ref<T> As(IUnknown* object) {
 
 std::string Utf8(std::wstring_view wide);
 
+// Room for a text of so many characters and a terminator, zero at first.
+class WideBuffer {
+public:
+    explicit WideBuffer(std::size_t characters) {
+        if (characters < std::size(few_)) {
+            std::fill_n(few_, characters + 1, L'\0');
+        } else {
+            many_.resize(characters + 1);
+        }
+    }
+    WideBuffer(const WideBuffer&) = delete;
+    WideBuffer& operator=(const WideBuffer&) = delete;
+    wchar_t* data() { return many_.empty() ? few_ : many_.data(); }
+
+private:
+    wchar_t few_[64];
+    std::wstring many_;
+};
+
 // A text that is given in two steps, its size in bytes and then itself. Empty
 // when there is none.
 template <class Length, class Text>
@@ -35,8 +56,8 @@ std::string TextInTwoSteps(const Length& length, const Text& text) {
     if (length(&bytes) < 0 || bytes == 0) {
         return {};
     }
-    std::wstring wide(bytes / sizeof(aafCharacter) + 1, L'\0');
-    return text(wide.data(), bytes) < 0 ? std::string() : Utf8(wide.c_str());
+    WideBuffer wide(bytes / sizeof(aafCharacter));
+    return text(wide.data(), bytes) < 0 ? std::string() : Utf8(wide.data());
 }
 
 // The same of an object, by two of its operations.

@@ -5,130 +5,96 @@
 
 #include <algorithm>
 #include <map>
+#include <unordered_map>
 
-#include "host_interfaces/aaf/AAFDefinitions.h"
-#include "host_interfaces/aaf/AAFDictionary.h"
-#include "host_interfaces/aaf/AAFEffectDefinitions.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "host_interfaces/aaf/AAFObjects.h"
-#include "host_interfaces/aaf/AAFPluginDefinitions.h"
-#include "host_interfaces/aaf/AAFTypeDefinitions.h"
-#include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "reference_host/cliphost/AafValue.h"
 
 namespace cliphost {
 namespace {
 
 constexpr int kDeepest = 32;  // objects inside objects
+constexpr std::size_t kUsualFacts = 12;
 
-TreeNode ReadObject(IAAFObject* object, int depth);
-
-eAAFTypeCategory_t CategoryOf(IAAFTypeDef* type) {
-    eAAFTypeCategory_t category = kAAFTypeCatUnknown;
-    if (type) {
-        type->GetTypeCategory(&category);
+// The names of definitions, each asked for once.
+template <class Definition>
+class Names {
+public:
+    const std::string& Of(const host::Ref<Definition>& definition) {
+        Named& named = names_[definition.get()];
+        if (!named.definition) {
+            named = {definition,
+                     TextOf(definition.get(), &Definition::GetNameBufLen, &Definition::GetName)};
+        }
+        return named.name;
     }
-    return category;
+
+private:
+    struct Named {
+        host::Ref<Definition> definition;  // so that no other comes to its place
+        std::string name;
+    };
+    std::unordered_map<Definition*, Named> names_;
+};
+
+// The order of properties is the library's affair; ours is by name.
+template <class Item>
+void InsertByName(Item item, std::vector<Item>& items) {
+    const auto place =
+        std::upper_bound(items.begin(), items.end(), item,
+                         [](const Item& a, const Item& b) { return a.name < b.name; });
+    items.insert(place, std::move(item));
 }
 
-host::Ref<IAAFTypeDef> TypeOf(IAAFPropertyValue* value) {
-    host::Ref<IAAFTypeDef> type;
-    value->GetType(type.Out());
-    return type;
-}
+class TreeReader {
+public:
+    TreeNode Read(IAAFObject* object, int depth);
 
-// The object behind a strong reference.
-host::Ref<IAAFObject> ObjectBehind(IAAFPropertyValue* value) {
-    const auto type = TypeOf(value);
-    const auto reference = As<IAAFTypeDefObjectRef>(type.get());
-    host::Ref<IUnknown> target;
-    if (reference) {
-        reference->GetObject(value, IID_IUnknown, target.Out());
-    }
-    return As<IAAFObject>(target.get());
-}
+private:
+    void ReadProperty(IAAFProperty& property, int depth, TreeNode& node);
 
-// Adds the objects that a property owns; false when it owns none.
-bool ReadParts(IAAFPropertyValue* value, int depth, std::vector<TreeNode>& parts) {
-    const auto type = TypeOf(value);
-    const eAAFTypeCategory_t category = CategoryOf(type.get());
-    if (category == kAAFTypeCatStrongObjRef) {
-        if (const auto object = ObjectBehind(value)) {
-            parts.push_back(ReadObject(object.get(), depth + 1));
-        }
-        return true;
-    }
-    host::Ref<IAAFTypeDef> elementType;
-    host::Ref<IEnumAAFPropertyValues> elements;
-    if (category == kAAFTypeCatVariableArray) {
-        const auto array = As<IAAFTypeDefVariableArray>(type.get());
-        if (array->GetType(elementType.Out()) < 0 ||
-            CategoryOf(elementType.get()) != kAAFTypeCatStrongObjRef) {
-            return false;
-        }
-        aafUInt32 count = 0;
-        array->GetCount(value, &count);
-        for (aafUInt32 i = 0; i < count; ++i) {
-            host::Ref<IAAFPropertyValue> element;
-            if (array->GetElementValue(value, i, element.Out()) >= 0) {
-                ReadParts(element.get(), depth, parts);
-            }
-        }
-        return true;
-    }
-    if (category == kAAFTypeCatSet) {
-        const auto set = As<IAAFTypeDefSet>(type.get());
-        if (set->GetElementType(elementType.Out()) < 0 ||
-            CategoryOf(elementType.get()) != kAAFTypeCatStrongObjRef ||
-            set->GetElements(value, elements.Out()) < 0) {
-            return false;
-        }
-        host::Ref<IAAFPropertyValue> element;
-        while (elements->NextOne(element.Out()) >= 0) {
-            ReadParts(element.get(), depth, parts);
-        }
-        return true;
-    }
-    return false;
-}
+    ValueReader values_;
+    Names<IAAFClassDef> classes_;
+    Names<IAAFPropertyDef> properties_;
+};
 
-TreeNode ReadObject(IAAFObject* object, int depth) {
+TreeNode TreeReader::Read(IAAFObject* object, int depth) {
     TreeNode node;
     host::Ref<IAAFClassDef> definition;
     if (object->GetDefinition(definition.Out()) >= 0) {
-        node.title = TextOf(definition.get(), &IAAFClassDef::GetNameBufLen, &IAAFClassDef::GetName);
+        node.title = classes_.Of(definition);
     }
     host::Ref<IEnumAAFProperties> properties;
     if (depth > kDeepest || object->GetProperties(properties.Out()) < 0) {
         return node;
     }
+    node.facts.reserve(kUsualFacts);
     host::Ref<IAAFProperty> property;
     while (properties->NextOne(property.Out()) >= 0) {
-        host::Ref<IAAFPropertyDef> propertyDefinition;
-        host::Ref<IAAFPropertyValue> value;
-        if (property->GetDefinition(propertyDefinition.Out()) < 0 ||
-            property->GetValue(value.Out()) < 0) {
-            continue;
-        }
-        const std::string name = TextOf(propertyDefinition.get(), &IAAFPropertyDef::GetNameBufLen,
-                                        &IAAFPropertyDef::GetName);
-        if (depth > 0 && name == "ObjClass") {
-            continue;  // the title says it
-        }
-        std::vector<TreeNode> parts;
-        if (ReadParts(value.get(), depth, parts)) {
-            node.branches.push_back({name, std::move(parts)});
-        } else if (name != "ObjClass") {
-            node.facts.push_back({name, ValueText(value.get())});
-        }
+        ReadProperty(*property, depth, node);
     }
-    // The order of properties is the library's affair; ours is by name.
-    std::stable_sort(node.facts.begin(), node.facts.end(),
-                     [](const auto& a, const auto& b) { return a.name < b.name; });
-    std::stable_sort(node.branches.begin(), node.branches.end(),
-                     [](const auto& a, const auto& b) { return a.name < b.name; });
     return node;
+}
+
+void TreeReader::ReadProperty(IAAFProperty& property, int depth, TreeNode& node) {
+    host::Ref<IAAFPropertyDef> definition;
+    host::Ref<IAAFPropertyValue> value;
+    if (property.GetDefinition(definition.Out()) < 0 || property.GetValue(value.Out()) < 0) {
+        return;
+    }
+    const std::string& name = properties_.Of(definition);
+    if (depth > 0 && name == "ObjClass") {
+        return;  // the title says it
+    }
+    std::vector<TreeNode> parts;
+    if (values_.TakeObjects(
+            value.get(), [&](IAAFObject* object) { parts.push_back(Read(object, depth + 1)); })) {
+        InsertByName(TreeNode::Branch{name, std::move(parts)}, node.branches);
+    } else if (name != "ObjClass") {
+        InsertByName(TreeNode::Fact{name, values_.Text(value.get())}, node.facts);
+    }
 }
 
 // Master, file, source: told by the byte in which their ids differ.
@@ -158,9 +124,10 @@ TreeNode ReadTree(IAAFFile* file) {
         return PlaceOf(a.get()) < PlaceOf(b.get());
     });
     TreeNode::Branch branch{"Mobs", {}};
+    TreeReader reader;
     for (const auto& each : mobs) {
         if (const auto object = As<IAAFObject>(each.get())) {
-            branch.nodes.push_back(ReadObject(object.get(), 0));
+            branch.nodes.push_back(reader.Read(object.get(), 0));
         }
     }
     root.branches.push_back(std::move(branch));
@@ -195,11 +162,10 @@ void ReplaceIds(TreeNode& node, const std::map<std::string, std::string>& number
 
 }  // namespace
 
-std::string ToReadableText(const TreeNode& tree, int indent) {
+std::string ToReadableText(TreeNode tree, int indent) {
     std::map<std::string, std::string> numbers = {{ToText(aafMobID_t{}), "nil"}};
-    TreeNode copy = tree;
     std::string text;
-    for (TreeNode::Branch& branch : copy.branches) {
+    for (TreeNode::Branch& branch : tree.branches) {
         for (std::size_t i = 0; i < branch.nodes.size(); ++i) {
             const std::string number = "mob " + std::to_string(i + 1);
             for (const TreeNode::Fact& fact : branch.nodes[i].facts) {
@@ -211,7 +177,7 @@ std::string ToReadableText(const TreeNode& tree, int indent) {
         }
         for (TreeNode& mob : branch.nodes) {
             ReplaceIds(mob, numbers);
-            text += ToText(mob, indent);
+            AppendText(mob, indent, text);
         }
     }
     return text;

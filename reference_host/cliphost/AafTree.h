@@ -15,6 +15,6 @@ TreeNode ReadTree(IAAFFile* file);
 
 // The same for people: mobs get numbers, which stand for their ids where other
 // mobs refer to them.
-std::string ToReadableText(const TreeNode& tree, int indent = 0);
+std::string ToReadableText(TreeNode tree, int indent = 0);
 
 }  // namespace cliphost

@@ -5,6 +5,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <vector>
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
@@ -15,235 +16,470 @@
 #include "text/Encodings.h"
 
 namespace cliphost {
+
+// What values of one type have in common. The type lives as long.
+class ValueType {
+public:
+    ValueType(ValueReader& reader, host::Ref<IAAFTypeDef> type)
+        : reader_(reader), type_(std::move(type)) {}
+    virtual ~ValueType() = default;
+    ValueType(const ValueType&) = delete;
+    ValueType& operator=(const ValueType&) = delete;
+
+    virtual std::string Text(IAAFPropertyValue* value) = 0;
+    virtual bool TakeObjects(IAAFPropertyValue*, const std::function<void(IAAFObject*)>&) {
+        return false;
+    }
+
+protected:
+    IAAFTypeDef* type() const { return type_.get(); }
+    ValueReader& reader() const { return reader_; }
+
+private:
+    ValueReader& reader_;
+    host::Ref<IAAFTypeDef> type_;
+};
+
 namespace {
 
 constexpr char kUnreadable[] = "?";
 constexpr aafUInt32 kMostElements = 64;  // of an array shown on one line
 
-aafUID_t TypeId(IAAFTypeDef* type) {
-    aafUID_t id{};
-    if (const auto meta = As<IAAFMetaDefinition>(type)) {
-        meta->GetAUID(&id);
+// A type behind one of its own interfaces.
+template <class Interface>
+class TypeAs : public ValueType {
+public:
+    TypeAs(ValueReader& reader, host::Ref<IAAFTypeDef> type)
+        : ValueType(reader, std::move(type)), as_(As<Interface>(this->type())) {}
+
+    std::string Text(IAAFPropertyValue* value) final {
+        return as_ ? TextOfValue(value) : kUnreadable;
     }
-    return id;
+
+protected:
+    virtual std::string TextOfValue(IAAFPropertyValue* value) = 0;
+    Interface* as() const { return as_.get(); }
+
+private:
+    host::Ref<Interface> as_;
+};
+
+eAAFTypeCategory_t CategoryOf(IAAFTypeDef* type) {
+    eAAFTypeCategory_t category = kAAFTypeCatUnknown;
+    if (type) {
+        type->GetTypeCategory(&category);
+    }
+    return category;
 }
 
 std::string NamedId(const std::string& name, const aafUID_t& id) {
-    return name.empty() ? ToText(id) : fmt::format("{} {}", name, ToText(id));
+    return name.empty() ? ToText(id) : name + ' ' + ToText(id);
 }
 
-std::string IntegerText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto integer = As<IAAFTypeDefInt>(type);
-    aafUInt32 size = 0;
-    aafBoolean_t isSigned = kAAFFalse;
-    aafInt64 number = 0;
-    if (!integer || integer->GetSize(&size) < 0 || integer->IsSigned(&isSigned) < 0 ||
-        size > sizeof number) {
-        return kUnreadable;
+class UnknownType final : public ValueType {
+public:
+    using ValueType::ValueType;
+    std::string Text(IAAFPropertyValue*) override { return kUnreadable; }
+};
+
+class IntegerType final : public TypeAs<IAAFTypeDefInt> {
+public:
+    IntegerType(ValueReader& reader, host::Ref<IAAFTypeDef> type)
+        : TypeAs(reader, std::move(type)) {
+        isReadable_ = as() && as()->GetSize(&size_) >= 0 && as()->IsSigned(&isSigned_) >= 0 &&
+                      size_ <= sizeof(aafInt64);
     }
-    unsigned char bytes[8] = {};
-    if (integer->GetInteger(value, bytes, size) < 0) {
-        return kUnreadable;
+
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        unsigned char bytes[8] = {};
+        if (!isReadable_ || as()->GetInteger(value, bytes, size_) < 0) {
+            return kUnreadable;
+        }
+        aafUInt64 raw = 0;
+        for (aafUInt32 i = size_; i-- > 0;) {
+            raw = raw << 8 | bytes[i];
+        }
+        if (!isSigned_) {
+            return std::to_string(raw);
+        }
+        const unsigned shift = 64 - 8 * size_;
+        return std::to_string(static_cast<aafInt64>(raw << shift) >> shift);
     }
-    aafUInt64 raw = 0;
-    for (aafUInt32 i = size; i-- > 0;) {
-        raw = raw << 8 | bytes[i];
-    }
-    if (!isSigned) {
-        return fmt::format("{}", raw);
-    }
-    const unsigned shift = 64 - 8 * size;
-    number = static_cast<aafInt64>(raw << shift) >> shift;
-    return fmt::format("{}", number);
-}
+
+private:
+    aafUInt32 size_ = 0;
+    aafBoolean_t isSigned_ = kAAFFalse;
+    bool isReadable_ = false;
+};
+
+// --- records ---------------------------------------------------------------------------------
 
 // A record whose structure is published, read whole.
 template <class Record>
-bool ReadRecord(IAAFTypeDefRecord& type, IAAFPropertyValue* value, Record& out) {
-    return type.GetStruct(value, reinterpret_cast<aafMemPtr_t>(&out), sizeof out) >= 0;
+std::string TextOfRecord(IAAFTypeDefRecord& type, IAAFPropertyValue* value) {
+    Record record{};
+    return type.GetStruct(value, reinterpret_cast<aafMemPtr_t>(&record), sizeof record) < 0
+               ? kUnreadable
+               : ToText(record);
 }
 
-std::string MembersText(IAAFTypeDefRecord& record, IAAFPropertyValue* value) {
-    aafUInt32 count = 0;
-    record.GetCount(&count);
-    std::string text;
-    for (aafUInt32 i = 0; i < count; ++i) {
-        host::Ref<IAAFPropertyValue> member;
-        const std::string name = TextOf(&record, &IAAFTypeDefRecord::GetMemberNameBufLen,
-                                        &IAAFTypeDefRecord::GetMemberName, i);
-        const bool read = record.GetValue(value, i, member.Out()) >= 0;
-        text += fmt::format("{}{} {}", i == 0 ? "" : ", ", name,
-                            read ? ValueText(member.get()) : kUnreadable);
-    }
-    return text;
-}
+struct PublishedRecord {
+    const aafUID_t& id;
+    std::string (*text)(IAAFTypeDefRecord&, IAAFPropertyValue*);
+};
+const PublishedRecord kPublishedRecords[] = {
+    {kAAFTypeID_Rational, TextOfRecord<aafRational_t>},
+    {kAAFTypeID_AUID, TextOfRecord<aafUID_t>},
+    {kAAFTypeID_MobIDType, TextOfRecord<aafMobID_t>},
+    {kAAFTypeID_TimeStamp, TextOfRecord<aafTimeStamp_t>},
+    {kAAFTypeID_VersionType, TextOfRecord<aafVersionType_t>},
+};
 
-std::string RecordText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto record = As<IAAFTypeDefRecord>(type);
-    if (!record) {
-        return kUnreadable;
+class RecordType final : public TypeAs<IAAFTypeDefRecord> {
+public:
+    RecordType(ValueReader& reader, host::Ref<IAAFTypeDef> type) : TypeAs(reader, std::move(type)) {
+        aafUID_t id{};
+        if (const auto meta = As<IAAFMetaDefinition>(this->type())) {
+            meta->GetAUID(&id);
+        }
+        for (const PublishedRecord& record : kPublishedRecords) {
+            published_ = record.id == id ? &record : published_;
+        }
+        aafUInt32 count = 0;
+        if (as() && published_ == nullptr) {
+            as()->GetCount(&count);
+        }
+        for (aafUInt32 i = 0; i < count; ++i) {
+            members_.push_back(TextOf(as(), &IAAFTypeDefRecord::GetMemberNameBufLen,
+                                      &IAAFTypeDefRecord::GetMemberName, i));
+        }
     }
-    const aafUID_t id = TypeId(type);
-    if (id == kAAFTypeID_Rational) {
-        aafRational_t rational{};
-        return ReadRecord(*record.get(), value, rational)
-                   ? fmt::format("{}/{}", rational.numerator, rational.denominator)
-                   : kUnreadable;
-    }
-    if (id == kAAFTypeID_AUID) {
-        aafUID_t auid{};
-        return ReadRecord(*record.get(), value, auid) ? ToText(auid) : kUnreadable;
-    }
-    if (id == kAAFTypeID_MobIDType) {
-        aafMobID_t mobId{};
-        return ReadRecord(*record.get(), value, mobId) ? ToText(mobId) : kUnreadable;
-    }
-    if (id == kAAFTypeID_TimeStamp) {
-        aafTimeStamp_t time{};
-        return ReadRecord(*record.get(), value, time) ? ToText(time) : kUnreadable;
-    }
-    if (id == kAAFTypeID_VersionType) {
-        aafVersionType_t version{};
-        return ReadRecord(*record.get(), value, version)
-                   ? fmt::format("{}.{}", static_cast<int>(version.major),
-                                 static_cast<int>(version.minor))
-                   : kUnreadable;
-    }
-    return MembersText(*record.get(), value);
-}
 
-std::string StringText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto string = As<IAAFTypeDefString>(type);
-    aafUInt32 count = 0;
-    if (!string || string->GetCount(value, &count) < 0 || count > 0x100000) {
-        return kUnreadable;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        if (published_ != nullptr) {
+            return published_->text(*as(), value);
+        }
+        std::string text;
+        for (aafUInt32 i = 0; i < members_.size(); ++i) {
+            host::Ref<IAAFPropertyValue> member;
+            const bool isRead = as()->GetValue(value, i, member.Out()) >= 0;
+            text += (i == 0 ? "" : ", ") + members_[i] + ' ' +
+                    (isRead ? reader().Text(member.get()) : kUnreadable);
+        }
+        return text;
     }
-    std::wstring wide(count + 1, L'\0');
-    if (string->GetElements(value, reinterpret_cast<aafMemPtr_t>(wide.data()),
-                            static_cast<aafUInt32>(count * sizeof(wchar_t))) < 0) {
-        return kUnreadable;
-    }
-    return fmt::format("\"{}\"", Utf8(wide.c_str()));
-}
 
-std::string EnumText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto enumeration = As<IAAFTypeDefEnum>(type);
-    aafInt64 number = 0;
-    if (!enumeration || enumeration->GetIntegerValue(value, &number) < 0) {
-        return kUnreadable;
-    }
-    const std::string name = TextOf(enumeration.get(), &IAAFTypeDefEnum::GetNameBufLenFromInteger,
-                                    &IAAFTypeDefEnum::GetNameFromInteger, number);
-    return name.empty() ? fmt::format("{}", number) : fmt::format("{} ({})", name, number);
-}
+private:
+    const PublishedRecord* published_ = nullptr;
+    std::vector<std::string> members_;
+};
 
-std::string ExtendibleEnumText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto enumeration = As<IAAFTypeDefExtEnum>(type);
-    aafUID_t id{};
-    if (!enumeration || enumeration->GetAUIDValue(value, &id) < 0) {
-        return kUnreadable;
-    }
-    const std::string name = TextOf<IAAFTypeDefExtEnum, aafUID_constref>(
-        enumeration.get(), &IAAFTypeDefExtEnum::GetNameBufLenFromAUID,
-        &IAAFTypeDefExtEnum::GetNameFromAUID, id);
-    return NamedId(name, id);
-}
+// --- texts and names -------------------------------------------------------------------------
 
-// A reference to a definition, by its name.
-std::string ReferenceText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto reference = As<IAAFTypeDefObjectRef>(type);
-    IUnknown* raw = nullptr;
-    if (!reference || reference->GetObject(value, IID_IUnknown, &raw) < 0 || !raw) {
-        return kUnreadable;
+class StringType final : public TypeAs<IAAFTypeDefString> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        aafUInt32 count = 0;
+        if (as()->GetCount(value, &count) < 0 || count > 0x100000) {
+            return kUnreadable;
+        }
+        WideBuffer wide(count);
+        if (as()->GetElements(value, reinterpret_cast<aafMemPtr_t>(wide.data()),
+                              static_cast<aafUInt32>(count * sizeof(wchar_t))) < 0) {
+            return kUnreadable;
+        }
+        return '"' + Utf8(wide.data()) + '"';
     }
-    host::Ref<IUnknown> target;
-    *target.Out() = raw;
-    if (const auto definition = As<IAAFDefObject>(target.get())) {
+};
+
+class EnumerationType final : public TypeAs<IAAFTypeDefEnum> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        aafInt64 number = 0;
+        if (as()->GetIntegerValue(value, &number) < 0) {
+            return kUnreadable;
+        }
+        const auto [text, isNew] = texts_.try_emplace(number);
+        if (isNew) {
+            const std::string name = TextOf(as(), &IAAFTypeDefEnum::GetNameBufLenFromInteger,
+                                            &IAAFTypeDefEnum::GetNameFromInteger, number);
+            text->second =
+                name.empty() ? std::to_string(number) : name + " (" + std::to_string(number) + ')';
+        }
+        return text->second;
+    }
+
+private:
+    std::unordered_map<aafInt64, std::string> texts_;
+};
+
+class ExtendibleEnumerationType final : public TypeAs<IAAFTypeDefExtEnum> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        aafUID_t id{};
+        if (as()->GetAUIDValue(value, &id) < 0) {
+            return kUnreadable;
+        }
+        return NamedId(TextOf<IAAFTypeDefExtEnum, aafUID_constref>(
+                           as(), &IAAFTypeDefExtEnum::GetNameBufLenFromAUID,
+                           &IAAFTypeDefExtEnum::GetNameFromAUID, id),
+                       id);
+    }
+};
+
+// The name of a definition.
+std::string NameOf(IUnknown* target) {
+    if (const auto definition = As<IAAFDefObject>(target)) {
         aafUID_t id{};
         definition->GetAUID(&id);
-        const std::string name =
-            TextOf(definition.get(), &IAAFDefObject::GetNameBufLen, &IAAFDefObject::GetName);
-        return NamedId(name, id);
+        return NamedId(
+            TextOf(definition.get(), &IAAFDefObject::GetNameBufLen, &IAAFDefObject::GetName), id);
     }
-    if (const auto meta = As<IAAFMetaDefinition>(target.get())) {
+    if (const auto meta = As<IAAFMetaDefinition>(target)) {
         return TextOf(meta.get(), &IAAFMetaDefinition::GetNameBufLen, &IAAFMetaDefinition::GetName);
     }
     return kUnreadable;
 }
 
-std::string ElementsText(aafUInt32 count, bool complete, const std::vector<std::string>& elements) {
+class WeakReferenceType final : public TypeAs<IAAFTypeDefObjectRef> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        host::Ref<IUnknown> target;
+        if (as()->GetObject(value, IID_IUnknown, target.Out()) < 0 || !target) {
+            return kUnreadable;
+        }
+        const auto [named, isNew] = names_.try_emplace(target.get());
+        if (isNew) {
+            named->second = {target, NameOf(target.get())};
+        }
+        return named->second.second;
+    }
+
+private:
+    std::unordered_map<IUnknown*, std::pair<host::Ref<IUnknown>, std::string>> names_;
+};
+
+// --- several in one --------------------------------------------------------------------------
+
+std::string ElementsText(aafUInt32 count, const std::vector<std::string>& elements) {
     std::string text = "[";
     for (const std::string& element : elements) {
         text += (text.size() > 1 ? ", " : "") + element;
     }
-    return text + (complete ? "]" : fmt::format(", ... {} in all]", count));
+    return text + (count <= kMostElements ? "]" : fmt::format(", ... {} in all]", count));
 }
 
-template <class ArrayType>
-std::string ArrayText(ArrayType& array, aafUInt32 count, IAAFPropertyValue* value) {
-    std::vector<std::string> elements;
-    for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
+template <class ArrayInterface>
+class ArrayType : public TypeAs<ArrayInterface> {
+public:
+    using TypeAs<ArrayInterface>::TypeAs;
+
+protected:
+    std::string ArrayText(aafUInt32 count, IAAFPropertyValue* value) {
+        std::vector<std::string> elements;
+        for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
+            host::Ref<IAAFPropertyValue> element;
+            elements.push_back(this->as()->GetElementValue(value, i, element.Out()) >= 0
+                                   ? this->reader().Text(element.get())
+                                   : kUnreadable);
+        }
+        return ElementsText(count, elements);
+    }
+};
+
+class FixedArrayType final : public ArrayType<IAAFTypeDefFixedArray> {
+public:
+    using ArrayType::ArrayType;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        aafUInt32 count = 0;
+        return as()->GetCount(&count) >= 0 ? ArrayText(count, value) : kUnreadable;
+    }
+};
+
+class VariableArrayType final : public ArrayType<IAAFTypeDefVariableArray> {
+public:
+    VariableArrayType(ValueReader& reader, host::Ref<IAAFTypeDef> type)
+        : ArrayType(reader, std::move(type)) {
+        host::Ref<IAAFTypeDef> element;
+        ownsObjects_ = as() && as()->GetType(element.Out()) >= 0 &&
+                       CategoryOf(element.get()) == kAAFTypeCatStrongObjRef;
+    }
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        aafUInt32 count = 0;
+        return as()->GetCount(value, &count) >= 0 ? ArrayText(count, value) : kUnreadable;
+    }
+    bool TakeObjects(IAAFPropertyValue* value,
+                     const std::function<void(IAAFObject*)>& take) override {
+        aafUInt32 count = 0;
+        if (ownsObjects_) {
+            as()->GetCount(value, &count);
+        }
+        for (aafUInt32 i = 0; i < count; ++i) {
+            host::Ref<IAAFPropertyValue> element;
+            if (as()->GetElementValue(value, i, element.Out()) >= 0) {
+                reader().TakeObjects(element.get(), take);
+            }
+        }
+        return ownsObjects_;
+    }
+
+private:
+    bool ownsObjects_ = false;
+};
+
+class SetType final : public TypeAs<IAAFTypeDefSet> {
+public:
+    SetType(ValueReader& reader, host::Ref<IAAFTypeDef> type) : TypeAs(reader, std::move(type)) {
+        host::Ref<IAAFTypeDef> element;
+        ownsObjects_ = as() && as()->GetElementType(element.Out()) >= 0 &&
+                       CategoryOf(element.get()) == kAAFTypeCatStrongObjRef;
+    }
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        host::Ref<IEnumAAFPropertyValues> enumerator;
+        aafUInt32 count = 0;
+        if (as()->GetCount(value, &count) < 0 || as()->GetElements(value, enumerator.Out()) < 0) {
+            return kUnreadable;
+        }
+        std::vector<std::string> elements;
         host::Ref<IAAFPropertyValue> element;
-        elements.push_back(array.GetElementValue(value, i, element.Out()) >= 0
-                               ? ValueText(element.get())
-                               : kUnreadable);
+        while (elements.size() < kMostElements && enumerator->NextOne(element.Out()) >= 0) {
+            elements.push_back(reader().Text(element.get()));
+        }
+        return ElementsText(count, elements);
     }
-    return ElementsText(count, count <= kMostElements, elements);
-}
-
-std::string VariableArrayText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto array = As<IAAFTypeDefVariableArray>(type);
-    aafUInt32 count = 0;
-    return array && array->GetCount(value, &count) >= 0 ? ArrayText(*array.get(), count, value)
-                                                        : kUnreadable;
-}
-
-std::string FixedArrayText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto array = As<IAAFTypeDefFixedArray>(type);
-    aafUInt32 count = 0;
-    return array && array->GetCount(&count) >= 0 ? ArrayText(*array.get(), count, value)
-                                                 : kUnreadable;
-}
-
-std::string SetText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto set = As<IAAFTypeDefSet>(type);
-    host::Ref<IEnumAAFPropertyValues> enumerator;
-    aafUInt32 count = 0;
-    if (!set || set->GetCount(value, &count) < 0 || set->GetElements(value, enumerator.Out()) < 0) {
-        return kUnreadable;
+    bool TakeObjects(IAAFPropertyValue* value,
+                     const std::function<void(IAAFObject*)>& take) override {
+        host::Ref<IEnumAAFPropertyValues> elements;
+        if (!ownsObjects_ || as()->GetElements(value, elements.Out()) < 0) {
+            return false;
+        }
+        host::Ref<IAAFPropertyValue> element;
+        while (elements->NextOne(element.Out()) >= 0) {
+            reader().TakeObjects(element.get(), take);
+        }
+        return true;
     }
-    std::vector<std::string> elements;
-    host::Ref<IAAFPropertyValue> element;
-    while (elements.size() < kMostElements && enumerator->NextOne(element.Out()) >= 0) {
-        elements.push_back(ValueText(element.get()));
+
+private:
+    bool ownsObjects_ = false;
+};
+
+class StrongReferenceType final : public TypeAs<IAAFTypeDefObjectRef> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue*) override { return kUnreadable; }
+    bool TakeObjects(IAAFPropertyValue* value,
+                     const std::function<void(IAAFObject*)>& take) override {
+        host::Ref<IUnknown> target;
+        if (as()) {
+            as()->GetObject(value, IID_IUnknown, target.Out());
+        }
+        if (const auto object = As<IAAFObject>(target.get())) {
+            take(object.get());
+        }
+        return true;
     }
-    return ElementsText(count, count <= kMostElements, elements);
+};
+
+// --- values of another type ------------------------------------------------------------------
+
+class IndirectType final : public TypeAs<IAAFTypeDefIndirect> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        host::Ref<IAAFPropertyValue> actual;
+        return as()->GetActualValue(value, actual.Out()) >= 0 ? reader().Text(actual.get())
+                                                              : kUnreadable;
+    }
+};
+
+class RenamedType final : public TypeAs<IAAFTypeDefRename> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        host::Ref<IAAFPropertyValue> base;
+        return as()->GetBaseValue(value, base.Out()) >= 0 ? reader().Text(base.get()) : kUnreadable;
+    }
+};
+
+template <class Type>
+std::unique_ptr<ValueType> MakeType(ValueReader& reader, const host::Ref<IAAFTypeDef>& type) {
+    return std::make_unique<Type>(reader, type);
 }
 
-std::string IndirectText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto indirect = As<IAAFTypeDefIndirect>(type);
-    host::Ref<IAAFPropertyValue> actual;
-    return indirect && indirect->GetActualValue(value, actual.Out()) >= 0 ? ValueText(actual.get())
-                                                                          : kUnreadable;
-}
+struct TypeRow {
+    eAAFTypeCategory_t category;
+    std::unique_ptr<ValueType> (*make)(ValueReader&, const host::Ref<IAAFTypeDef>&);
+};
+constexpr TypeRow kTypes[] = {
+    {kAAFTypeCatInt, MakeType<IntegerType>},
+    {kAAFTypeCatRecord, MakeType<RecordType>},
+    {kAAFTypeCatString, MakeType<StringType>},
+    {kAAFTypeCatEnum, MakeType<EnumerationType>},
+    {kAAFTypeCatExtEnum, MakeType<ExtendibleEnumerationType>},
+    {kAAFTypeCatWeakObjRef, MakeType<WeakReferenceType>},
+    {kAAFTypeCatStrongObjRef, MakeType<StrongReferenceType>},
+    {kAAFTypeCatVariableArray, MakeType<VariableArrayType>},
+    {kAAFTypeCatFixedArray, MakeType<FixedArrayType>},
+    {kAAFTypeCatSet, MakeType<SetType>},
+    {kAAFTypeCatIndirect, MakeType<IndirectType>},
+    {kAAFTypeCatRename, MakeType<RenamedType>},
+};
 
-std::string RenamedText(IAAFTypeDef* type, IAAFPropertyValue* value) {
-    const auto rename = As<IAAFTypeDefRename>(type);
-    host::Ref<IAAFPropertyValue> base;
-    return rename && rename->GetBaseValue(value, base.Out()) >= 0 ? ValueText(base.get())
-                                                                  : kUnreadable;
+std::unique_ptr<ValueType> MakeType(ValueReader& reader, const host::Ref<IAAFTypeDef>& type) {
+    const eAAFTypeCategory_t category = CategoryOf(type.get());
+    for (const TypeRow& row : kTypes) {
+        if (row.category == category) {
+            return row.make(reader, type);
+        }
+    }
+    return std::make_unique<UnknownType>(reader, type);
 }
 
 }  // namespace
 
 std::string Utf8(std::wstring_view wide) {
+    if (std::all_of(wide.begin(), wide.end(), [](wchar_t c) { return (c & ~0x7F) == 0; })) {
+        std::string text(wide.size(), '\0');
+        std::transform(wide.begin(), wide.end(), text.begin(),
+                       [](wchar_t c) { return static_cast<char>(c); });
+        return text;
+    }
     return encodings::ToUtf8Lossy(encodings::FromWide(wide));
 }
 
+namespace {
+
+constexpr char kUpper[] = "0123456789ABCDEF";
+constexpr char kLower[] = "0123456789abcdef";
+
+// Two digits for each of the bytes, which are what the numbers end in.
+void AppendHex(const char* digits, std::initializer_list<unsigned> bytes, std::string& text) {
+    for (const unsigned byte : bytes) {
+        text += digits[byte >> 4 & 15];
+        text += digits[byte & 15];
+    }
+}
+
+}  // namespace
+
 std::string ToText(const aafUID_t& id) {
-    return fmt::format("{{{:08X}-{:04X}-{:04X}-{:02X}{:02X}-{:02X}{:02X}{:02X}{:02X}{:02X}{:02X}}}",
-                       id.Data1, id.Data2, id.Data3, id.Data4[0], id.Data4[1], id.Data4[2],
-                       id.Data4[3], id.Data4[4], id.Data4[5], id.Data4[6], id.Data4[7]);
+    const unsigned char* const node = id.Data4;
+    std::string text = "{";
+    AppendHex(kUpper, {id.Data1 >> 24, id.Data1 >> 16, id.Data1 >> 8, id.Data1}, text);
+    text += '-';
+    AppendHex(kUpper, {unsigned{id.Data2} >> 8, id.Data2}, text);
+    text += '-';
+    AppendHex(kUpper, {unsigned{id.Data3} >> 8, id.Data3}, text);
+    text += '-';
+    AppendHex(kUpper, {node[0], node[1]}, text);
+    text += '-';
+    AppendHex(kUpper, {node[2], node[3], node[4], node[5], node[6], node[7]}, text);
+    return text + '}';
 }
 
 // SMPTE ST 330: 32 bytes in groups of four.
@@ -261,7 +497,10 @@ std::string ToText(const aafMobID_t& id) {
     bytes.insert(bytes.end(), m.Data4, m.Data4 + 8);
     std::string text = "urn:smpte:umid:";
     for (std::size_t i = 0; i < bytes.size(); ++i) {
-        text += fmt::format("{}{:02x}", i > 0 && i % 4 == 0 ? "." : "", bytes[i]);
+        if (i > 0 && i % 4 == 0) {
+            text += '.';
+        }
+        AppendHex(kLower, {bytes[i]}, text);
     }
     return text;
 }
@@ -273,36 +512,38 @@ std::string ToText(const aafTimeStamp_t& time) {
                        unsigned{time.time.fraction});
 }
 
-std::string ValueText(IAAFPropertyValue* value) {
-    using Reader = std::string (*)(IAAFTypeDef*, IAAFPropertyValue*);
-    struct Row {
-        eAAFTypeCategory_t category;
-        Reader read;
-    };
-    static constexpr Row kReaders[] = {
-        {kAAFTypeCatInt, IntegerText},
-        {kAAFTypeCatRecord, RecordText},
-        {kAAFTypeCatString, StringText},
-        {kAAFTypeCatEnum, EnumText},
-        {kAAFTypeCatExtEnum, ExtendibleEnumText},
-        {kAAFTypeCatWeakObjRef, ReferenceText},
-        {kAAFTypeCatVariableArray, VariableArrayText},
-        {kAAFTypeCatFixedArray, FixedArrayText},
-        {kAAFTypeCatSet, SetText},
-        {kAAFTypeCatIndirect, IndirectText},
-        {kAAFTypeCatRename, RenamedText},
-    };
+std::string ToText(const aafRational_t& rational) {
+    return std::to_string(rational.numerator) + '/' + std::to_string(rational.denominator);
+}
+
+std::string ToText(const aafVersionType_t& version) {
+    return fmt::format("{}.{}", static_cast<int>(version.major), static_cast<int>(version.minor));
+}
+
+ValueReader::ValueReader() = default;
+ValueReader::~ValueReader() = default;
+
+ValueType* ValueReader::TypeOf(IAAFPropertyValue* value) {
     host::Ref<IAAFTypeDef> type;
-    eAAFTypeCategory_t category = kAAFTypeCatUnknown;
-    if (!value || value->GetType(type.Out()) < 0 || type->GetTypeCategory(&category) < 0) {
-        return kUnreadable;
+    if (!value || value->GetType(type.Out()) < 0 || !type) {
+        return nullptr;
     }
-    for (const Row& row : kReaders) {
-        if (row.category == category) {
-            return row.read(type.get(), value);
-        }
+    std::unique_ptr<ValueType>& known = types_[type.get()];
+    if (!known) {
+        known = MakeType(*this, type);
     }
-    return kUnreadable;
+    return known.get();
+}
+
+std::string ValueReader::Text(IAAFPropertyValue* value) {
+    ValueType* const type = TypeOf(value);
+    return type == nullptr ? kUnreadable : type->Text(value);
+}
+
+bool ValueReader::TakeObjects(IAAFPropertyValue* value,
+                              const std::function<void(IAAFObject*)>& take) {
+    ValueType* const type = TypeOf(value);
+    return type != nullptr && type->TakeObjects(value, take);
 }
 
 }  // namespace cliphost

@@ -2,6 +2,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <functional>
+#include <memory>
+#include <string>
+#include <unordered_map>
+
 #include "host_interfaces/aaf/AAFObjects.h"
 #include "reference_host/cliphost/AafQuery.h"
 
@@ -11,10 +16,32 @@ namespace cliphost {
 std::string ToText(const aafUID_t& id);
 std::string ToText(const aafMobID_t& id);
 std::string ToText(const aafTimeStamp_t& time);
+std::string ToText(const aafRational_t& rational);
+std::string ToText(const aafVersionType_t& version);
 
-// A property value as text: numbers, names of enumerations, texts in quotes,
-// records by their members, references to definitions by name. Anything that
-// can't be read is "?".
-std::string ValueText(IAAFPropertyValue* value);
+class ValueType;
+
+// Reads the property values of one file. What definitions tell, which many values share, is
+// asked of the library once.
+class ValueReader {
+public:
+    ValueReader();
+    ~ValueReader();
+    ValueReader(const ValueReader&) = delete;
+    ValueReader& operator=(const ValueReader&) = delete;
+
+    // A value as text: numbers, names of enumerations, texts in quotes, records by their
+    // members, references to definitions by name. Anything that can't be read is "?".
+    std::string Text(IAAFPropertyValue* value);
+    // Hands over the objects that a value owns, one after the other; false for a value of a
+    // type that owns none.
+    bool TakeObjects(IAAFPropertyValue* value, const std::function<void(IAAFObject*)>& take);
+
+private:
+    // Null for a value that tells no type.
+    ValueType* TypeOf(IAAFPropertyValue* value);
+
+    std::unordered_map<IAAFTypeDef*, std::unique_ptr<ValueType>> types_;
+};
 
 }  // namespace cliphost

@@ -2,10 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/MovieAnswer.h"
 
-#include <nlohmann/json.hpp>
-
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Fields.h"
+#include "reference_host/cliphost/JsonText.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/util/text/Printable.h"
@@ -13,18 +12,7 @@
 namespace cliphost {
 namespace {
 
-// An entry of the list has two levels above it.
-std::string InEntry(const std::string& json) {
-    std::string text;
-    text.reserve(json.size() + json.size() / 4);
-    for (const char c : json) {
-        text += c;
-        if (c == '\n') {
-            text += "    ";
-        }
-    }
-    return text;
-}
+constexpr int kLevelOfDescription = 2;  // in the list of all entries
 
 bool IsRoute(const std::string& text) {
     for (const char* const known : {"", route::kHeader, route::kLibrary, route::kNone}) {
@@ -65,7 +53,7 @@ MovieAnswer AnswerOf(Session& session, const Description& description, const Des
         const RouteTaken taken = RouteOf(description.movie);
         answer.route = taken.route;
         answer.routeReason = taken.reason;
-        answer.description = InEntry(ToJson(shown()));
+        answer.description = ToJson(shown(), kLevelOfDescription);
     } else if (!form.quiet) {
         answer.description = ToReadableText(shown(), 1);
     }
@@ -108,7 +96,7 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     }
     answer.status = static_cast<int>(status);
     if (form.json) {
-        return status != kExitFine || nlohmann::json::accept(answer.description);
+        return status != kExitFine || IsJsonOfTexts(answer.description);
     }
     answer.description = host::text::PrintableLines(answer.description);
     return true;

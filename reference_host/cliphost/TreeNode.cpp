@@ -3,62 +3,99 @@
 
 #include "reference_host/cliphost/TreeNode.h"
 
-#include <fmt/format.h>
-
-#include <nlohmann/json.hpp>
-
+#include "reference_host/cliphost/JsonText.h"
 #include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
 namespace {
 
-nlohmann::ordered_json JsonOf(const TreeNode& node) {
-    nlohmann::ordered_json json;
-    json["class"] = node.title;
+std::string Margin(int level) {
+    return std::string(static_cast<std::size_t>(level) * 2, ' ');
+}
+
+// A new line for a member of a JSON object that has others before it, and its name.
+void AppendJsonName(const std::string& margin, const std::string& name, std::string& out) {
+    out += ",\n";
+    out += margin;
+    AppendJsonText(name, out);
+    out += ": ";
+}
+
+void AppendJson(const TreeNode& node, int level, std::string& out) {
+    const std::string margin = Margin(level + 1);
+    out += "{\n";
+    out += margin;
+    out += "\"class\": ";
+    AppendJsonText(node.title, out);
     for (const TreeNode::Fact& fact : node.facts) {
-        json[fact.name] = fact.value;
+        AppendJsonName(margin, fact.name, out);
+        AppendJsonText(fact.value, out);
     }
     for (const TreeNode::Branch& branch : node.branches) {
-        nlohmann::ordered_json list = nlohmann::ordered_json::array();
+        AppendJsonName(margin, branch.name, out);
+        const char* before = "[\n";
         for (const TreeNode& child : branch.nodes) {
-            list.push_back(JsonOf(child));
+            out += before;
+            out += margin;
+            out += "  ";
+            AppendJson(child, level + 2, out);
+            before = ",\n";
         }
-        json[branch.name] = std::move(list);
+        out += branch.nodes.empty() ? "[]" : "\n" + margin + "]";
     }
-    return json;
+    out += '\n';
+    out.append(margin, 0, margin.size() - 2);
+    out += '}';
 }
 
 // A line for the title and one for each fact, however long. So trees of one shape
 // have their facts on the same lines, and when one fact changes only its line does.
 // A single part follows the name of its property.
-void Write(const TreeNode& node, int indent, const std::string& property, std::string& out) {
-    const std::string margin(static_cast<std::size_t>(indent) * 2, ' ');
-    out += fmt::format("{}{}{}\n", margin, property, node.title);
+void AppendLines(const TreeNode& node, int indent, const std::string& property, std::string& out) {
+    const std::string margin = Margin(indent);
+    out += margin;
+    out += property;
+    out += node.title;
+    out += '\n';
     for (const TreeNode::Fact& fact : node.facts) {
-        out += fmt::format("{}  {} = {}\n", margin, fact.name, host::text::Printable(fact.value));
+        out += margin;
+        out += "  ";
+        out += fact.name;
+        out += " = ";
+        out += host::text::Printable(fact.value);
+        out += '\n';
     }
     for (const TreeNode::Branch& branch : node.branches) {
         if (branch.nodes.size() == 1) {
-            Write(branch.nodes[0], indent + 1, branch.name + ": ", out);
+            AppendLines(branch.nodes[0], indent + 1, branch.name + ": ", out);
             continue;
         }
-        out += fmt::format("{}  {}:\n", margin, branch.name);
+        out += margin;
+        out += "  ";
+        out += branch.name;
+        out += ":\n";
         for (const TreeNode& child : branch.nodes) {
-            Write(child, indent + 2, "", out);
+            AppendLines(child, indent + 2, "", out);
         }
     }
 }
 
 }  // namespace
 
+void AppendText(const TreeNode& node, int indent, std::string& out) {
+    AppendLines(node, indent, "", out);
+}
+
 std::string ToText(const TreeNode& node, int indent) {
     std::string out;
-    Write(node, indent, "", out);
+    AppendText(node, indent, out);
     return out;
 }
 
-std::string ToJson(const TreeNode& node, int indent) {
-    return JsonOf(node).dump(indent, ' ', false, nlohmann::json::error_handler_t::replace);
+std::string ToJson(const TreeNode& node, int level) {
+    std::string out;
+    AppendJson(node, level, out);
+    return out;
 }
 
 }  // namespace cliphost

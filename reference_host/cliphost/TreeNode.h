@@ -27,7 +27,8 @@ struct TreeNode {
 
 // Indented lines, one for each fact whatever it holds.
 std::string ToText(const TreeNode& node, int indent = 0);
-// The same as JSON text.
-std::string ToJson(const TreeNode& node, int indent = 2);
+void AppendText(const TreeNode& node, int indent, std::string& out);
+// The same as JSON text, which may stand so many levels inside other JSON.
+std::string ToJson(const TreeNode& node, int level = 0);
 
 }  // namespace cliphost

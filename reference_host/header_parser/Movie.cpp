@@ -117,13 +117,6 @@ Verdict SetDuration(const MovieHeader& header, Movie& movie) {
 
 }  // namespace
 
-bool Movie::IsSelfContained() const {
-    return std::all_of(tracks.begin(), tracks.end(), [](const Track& track) {
-        return std::find(track.isInFile.begin(), track.isInFile.end(), false) ==
-               track.isInFile.end();
-    });
-}
-
 Verdict ReadMovie(HeaderBytes&& bytes, const ParserLimits& limits, Movie& movie) {
     movie.bytes = std::move(bytes);
     Verdict verdict = Inflate(movie.bytes, limits, &movie.isUnpacked);
@@ -141,6 +134,9 @@ Verdict ReadMovie(HeaderBytes&& bytes, const ParserLimits& limits, Movie& movie)
         if (verdict.Refused()) {
             return verdict;
         }
+        const std::vector<bool>& isInFile = movie.tracks.back().isInFile;
+        movie.isSelfContained = movie.isSelfContained && std::find(isInFile.begin(), isInFile.end(),
+                                                                   false) == isInFile.end();
         channels += ChannelsOf(movie.tracks.back());
         if (channels > limits.maxSoundChannels) {
             return TooMuch("the sound tracks of the movie have more than 1024 channels in total");

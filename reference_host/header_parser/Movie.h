@@ -58,11 +58,11 @@ struct Movie {
     // Places of the tracks of each kind, in the same order.
     std::array<std::vector<ncfUInt32>, kTrackKinds> ofKind;
     std::optional<TimecodeAddress> startAddress;  // of the first timecode track
+    bool isSelfContained = true;  // no description of any track refers to another file
 
     const std::vector<ncfUInt32>& Of(TrackKind kind) const {
         return ofKind[static_cast<std::size_t>(kind)];
     }
-    bool IsSelfContained() const;
 };
 
 // Reads what stands within the movie atom. The bytes are taken over.

@@ -239,7 +239,7 @@ NCFRESULT QTParser::GetTimeCodeInfo(ncfUInt8* hours, ncfUInt8* minutes, ncfUInt8
 }
 
 NCFRESULT QTParser::IsMovieSelfContained(ncfBool* selfContained) {
-    return Give([](const Movie& movie) { return movie.IsSelfContained(); }, selfContained);
+    return Give([](const Movie& movie) { return movie.isSelfContained; }, selfContained);
 }
 
 NCFRESULT QTParser::GetMOOVAtom(ncfUInt64* position, ncfUInt64* size) {

@@ -98,8 +98,7 @@ public:
 private:
     struct TrackMapEntry {
         NCFSmartPtr<ITrackInfo> info_;
-        ncfUInt32 index;  // within its kind
-        ncfUInt32 type;   // one of TrackType
+        ncfUInt32 type;  // one of TrackType
     };
 
     NCFRESULT ParseMediaHeaders();
@@ -152,4 +151,6 @@ private:
     mutable NCFSmartPtr<IVideoTrackInfo> firstVideoTrackInfo_;  // filled on first use
     mutable NCFSmartPtr<IAudioTrackInfo> firstAudioTrackInfo_;
     std::map<ncfUInt32, TrackMapEntry> tracks_;  // by the movie's track id
+    // The ids by type and place within the kind.
+    std::map<std::pair<ncfUInt32, ncfUInt32>, ncfUInt32> trackIds_;
 };

@@ -83,7 +83,9 @@ NCFRESULT QuickTimeClip::CollectTracks(const char* statement,
         NCF_RETURN_TEXT(statement, (qtParser_.inArg()->*getTrackInfo)(i, trackInfo.inOutArg()));
         ncfUInt32 qtTrack = 0;
         trackInfo->GetTrackId(&qtTrack);
-        tracks_.insert({qtTrack, TrackMapEntry{trackInfo.inArg(), i, type}});
+        if (tracks_.insert({qtTrack, TrackMapEntry{trackInfo.inArg(), type}}).second) {
+            trackIds_[{type, i}] = qtTrack;
+        }
     }
     return NCF_OK;
 }

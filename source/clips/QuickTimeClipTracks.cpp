@@ -10,13 +10,12 @@
 // --- tracks ---------------------------------------------------------------------------
 
 NCFRESULT QuickTimeClip::FindTrack(ncfUInt32 index, ncfUInt32 type, ncfUInt32& qtTrack) const {
-    for (const auto& track : tracks_) {
-        if (track.second.index == index && track.second.type == type) {
-            qtTrack = track.first;
-            return NCF_OK;
-        }
+    const auto found = trackIds_.find({type, index});
+    if (found == trackIds_.end()) {
+        return NCF_E_NOTFOUND;
     }
-    return NCF_E_NOTFOUND;
+    qtTrack = found->second;
+    return NCF_OK;
 }
 
 NCFRESULT QuickTimeClip::GetTrackType(ncfUInt32 qtTrack, ncfUInt32* trackType) {

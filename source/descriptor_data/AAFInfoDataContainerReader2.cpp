@@ -43,6 +43,11 @@ AAFInfoDataContainerReader2::AAFInfoDataContainerReader2(const GenericXMLDataCon
 
 NCFRESULT AAFInfoDataContainerReader2::GetMediaDescriptorSignature(ncfUInt32 vcid, ncfUInt32 width,
                                                                    ncfUInt32 height) {
+    const std::array<ncfUInt32, 3> wanted = {vcid, width, height};
+    if (found_ == wanted) {
+        return NCF_OK;
+    }
+    found_.reset();
     std::vector<XMLDataPropertyValue*> entries;
     container_->GetEntries(std::to_string(static_cast<ncfSInt32>(vcid)).c_str(), &entries);
     for (XMLDataPropertyValue* entry : entries) {
@@ -53,6 +58,7 @@ NCFRESULT AAFInfoDataContainerReader2::GetMediaDescriptorSignature(ncfUInt32 vci
         }
         if (DescriptorFits(width, height, entries.size() == 1)) {
             signature_ = entry;
+            found_ = wanted;
             return NCF_OK;
         }
     }

@@ -3,6 +3,8 @@
 
 #pragma once
 
+#include <array>
+#include <optional>
 #include <vector>
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
@@ -114,6 +116,8 @@ private:
     const ncfUInt32 m_curHeight;
     XMLDataPropertyValue* signature_ = nullptr;   // the entry found
     XMLDataPropertyValue* descriptor_ = nullptr;  // its descriptor
+    // Id, width and height that it was found for; each value is asked of the same entry.
+    std::optional<std::array<ncfUInt32, 3>> found_;
     bool isMPEG2_ = false;
     bool isRGBA_ = false;
 };

@@ -67,11 +67,9 @@ struct Sse41 {
 std::size_t ConvertRowSse41(const LumaWeights& weights, const ncfUInt8* source,
                             ncfUInt8* destination, std::size_t pixels) {
     const std::size_t groups = pixels / 4;
-    const auto convert = IsAligned(source)        ? IsAligned(destination)
-                                                        ? &ConvertGroups<Sse41<true, true>>
-                                                        : &ConvertGroups<Sse41<true, false>>
-                                : IsAligned(destination) ? &ConvertGroups<Sse41<false, true>>
-                                                  : &ConvertGroups<Sse41<false, false>>;
-    convert(weights, source, destination, groups);
+    constexpr decltype(&ConvertGroups<Sse41<false, false>>) kConvert[2][2] = {
+        {&ConvertGroups<Sse41<false, false>>, &ConvertGroups<Sse41<false, true>>},
+        {&ConvertGroups<Sse41<true, false>>, &ConvertGroups<Sse41<true, true>>}};
+    kConvert[IsAligned(source)][IsAligned(destination)](weights, source, destination, groups);
     return groups * 4;
 }

@@ -53,6 +53,27 @@ TEST(TreeNode, IsJsonWithTheSameNames) {
     EXPECT_EQ(json["Descriptor"][0]["class"], "Picture");
 }
 
+TEST(TreeNode, IsLaidOutAsOtherJsonIsInWhichItStands) {
+    EXPECT_EQ(ToJson({"Mob", {{"Name", "a"}}, {{"Slots", {}}, {"Parts", {{"Part", {}, {}}}}}}),
+              R"({
+  "class": "Mob",
+  "Name": "a",
+  "Slots": [],
+  "Parts": [
+    {
+      "class": "Part"
+    }
+  ]
+})");
+    for (const int level : {0, 1, 3}) {
+        nlohmann::ordered_json around = nlohmann::ordered_json::parse(ToJson(Mob()));
+        for (int i = 0; i < level; ++i) {
+            around = nlohmann::ordered_json::array({around});
+        }
+        EXPECT_NE(around.dump(2).find(ToJson(Mob(), level)), std::string::npos) << level;
+    }
+}
+
 TEST(TreeNode, IsJsonAlsoWithBytesThatAreNoText) {
     const TreeNode node{"Mob", {{"Name", "\xFF\xFE"}}, {}};
     EXPECT_TRUE(nlohmann::json::accept(ToJson(node)));

@@ -60,6 +60,19 @@ TEST_F(QuickTimeClipTracks, FindsIdsByPlaceWithinAKind) {
     EXPECT_EQ(id, 5u);
 }
 
+TEST_F(QuickTimeClipTracks, LosesATrackWhoseIdIsTaken) {
+    parser->AddVideoTrack(7);
+    parser->AddAudioTrack(7);
+    parser->AddAudioTrack(9);
+    Load();
+    ncfUInt32 id = 0;
+    EXPECT_EQ(clip->GetVideoTrackQTId(0, id), NCF_OK);
+    EXPECT_EQ(id, 7u);
+    EXPECT_EQ(clip->GetAudioTrackQTId(0, id), NCF_E_NOTFOUND);
+    EXPECT_EQ(clip->GetAudioTrackQTId(1, id), NCF_OK);
+    EXPECT_EQ(id, 9u);
+}
+
 TEST_F(QuickTimeClipTracks, DoesNotFindWhatIsNotThere) {
     LoadMany();
     ncfUInt32 id = 77;

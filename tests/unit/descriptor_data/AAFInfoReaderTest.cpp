@@ -58,6 +58,22 @@ TEST_F(AAFInfoReaderTest, TheFirstOfSeveralWhoseHeightFitsWins) {
     EXPECT_EQ(Search(720, 500), NCF_E_NOTSUPPORTED);
 }
 
+TEST_F(AAFInfoReaderTest, EachValueIsOfItsOwnEntryWhateverWasSearchedForBefore) {
+    Load(Marked(1, Size(720, 576)) + Marked(2, Size(720, 486)));
+    Reader reader(*this, 720, 576, 1);
+    const auto mark = [&] {
+        ncfUInt32 found = 0;
+        EXPECT_EQ(reader.GetOneProperty("rp210:MaxGOP", &found), NCF_OK);
+        return found;
+    };
+    EXPECT_EQ(mark(), 1u);
+    EXPECT_EQ(mark(), 1u);
+    EXPECT_EQ(reader.GetMediaDescriptorSignature(1, 720, 486), NCF_OK);
+    EXPECT_EQ(mark(), 1u);
+    EXPECT_EQ(reader.GetMediaDescriptorSignature(1, 720, 500), NCF_E_NOTSUPPORTED);
+    EXPECT_EQ(mark(), 1u);
+}
+
 TEST_F(AAFInfoReaderTest, FieldsMatchFramesAndFramesFields) {
     Load(Marked(1, Size(1920, 540)) + Marked(2, Size(1440, 1080)));
     EXPECT_EQ(Search(1920, 1080), NCF_OK);  // half

@@ -113,6 +113,11 @@ TEST(Movie, IsSelfContainedUntilADescriptionRefersToAnotherFile) {
         movie.tracks[0].descriptions = {movies::VideoFormat().ToBox(), format.ToBox()};
         EXPECT_EQ(Ask(&ParsedMovie(movie).Parser(), &IQTParser::IsMovieSelfContained), 0);
     }
+    // Also where the tracks before and behind it have their media in the file.
+    movie = PlainMovie();
+    movie.tracks.insert(movie.tracks.begin() + 1, movie.tracks[0]);
+    movie.tracks[1].dataReferences = {{"url ", false, "file:///b"}};
+    EXPECT_EQ(Ask(&ParsedMovie(movie).Parser(), &IQTParser::IsMovieSelfContained), 0);
 }
 
 TEST(Movie, IsNotSelfContainedWhenAnotherTrackIsNot) {

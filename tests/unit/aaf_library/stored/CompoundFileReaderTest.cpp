@@ -154,6 +154,71 @@ TEST(CompoundFileReader, RefusesTwoStreamsThatShareASector) {
     EXPECT_EQ(refusal(file), "sector 0 is used twice");
 }
 
+namespace {
+
+// Header and empty sectors of a file that is made by hand.
+Bytes FileOf(std::uint32_t sectors, std::uint32_t sectorShift) {
+    Bytes file((1 + std::size_t{sectors}) << sectorShift);
+    std::copy(std::begin(kCompoundMagic), std::end(kCompoundMagic), file.begin());
+    file[28] = 0xFE;
+    file[29] = 0xFF;
+    file[kSectorShiftOffset] = static_cast<std::uint8_t>(sectorShift);
+    file[32] = 6;
+    put(file, kSmallLimitOffset, kSmallStreamLimit);
+    put(file, kFirstSmallTableOffset, kEndOfChain);
+    return file;
+}
+
+void PutEntry(Bytes& file, std::size_t at, const std::string& name, std::uint8_t kind,
+              std::uint32_t right, std::uint32_t child) {
+    for (std::size_t c = 0; c < name.size(); ++c) {
+        file[at + 2 * c] = static_cast<std::uint8_t>(name[c]);
+    }
+    file[at + 64] = static_cast<std::uint8_t>(2 * name.size() + 2);
+    file[at + 66] = kind;
+    put(file, at + kEntryLeftOffset, kFreeSector);
+    put(file, at + kEntryRightOffset, right);
+    put(file, at + kEntryChildOffset, child);
+}
+
+// A file of small sectors with so many of them for the allocation table: they come first,
+// behind them the sectors that list those for which the header has no place, then the directory.
+Bytes FileWithTables(std::uint32_t tables) {
+    constexpr std::uint32_t kListed = 127;  // of 128 numbers the last names the next list
+    const std::uint32_t beyond = tables > kHeaderTableCount ? tables - kHeaderTableCount : 0;
+    const std::uint32_t lists = (beyond + kListed - 1) / kListed;
+    const std::uint32_t directory = tables + lists;
+    Bytes file = FileOf(directory + 1, 9);
+    std::fill(file.begin() + 512, file.end() - 512, std::uint8_t{0xFF});
+    const auto place = [](std::uint32_t sector) { return (std::size_t{sector} + 1) * 512; };
+    put(file, kTableCountOffset, tables);
+    put(file, kFirstDirectoryOffset, directory);
+    put(file, kFirstTableListOffset, lists > 0 ? tables : kEndOfChain);
+    for (std::uint32_t i = 0; i < tables; ++i) {
+        const std::uint32_t behind = i - kHeaderTableCount;
+        put(file,
+            i < kHeaderTableCount
+                ? kTableListOffset + 4 * std::size_t{i}
+                : place(tables + behind / kListed) + 4 * std::size_t{behind % kListed},
+            i);
+    }
+    for (std::uint32_t i = 0; i < lists; ++i) {
+        put(file, place(tables + i) + 4 * kListed, i + 1 < lists ? tables + i + 1 : kEndOfChain);
+    }
+    put(file, place(0) + 4 * std::size_t{directory}, kEndOfChain);
+    PutEntry(file, place(directory), "Root Entry", 5, kFreeSector, kFreeSector);
+    return file;
+}
+
+}  // namespace
+
+TEST(CompoundFileReader, ReadsAsManyTablesAsTheHeaderCounts) {
+    // Those of the header alone; one, all but one and all of a list; two of a second list.
+    for (const std::uint32_t tables : {108u, 109u, 110u, 109u + 126u, 109u + 127u, 109u + 129u}) {
+        EXPECT_EQ(refusal(FileWithTables(tables)), "") << tables;
+    }
+}
+
 // Siblings in one long chain are what a simple writer makes of a large set;
 // no walk may go deeper with their number.
 TEST(CompoundFileReader, WalksAVeryLongChainOfSiblings) {
@@ -161,16 +226,9 @@ TEST(CompoundFileReader, WalksAVeryLongChainOfSiblings) {
     constexpr std::uint32_t perSector = 4096 / kDirectoryEntrySize;
     const std::uint32_t directorySectors = (count + 1 + perSector - 1) / perSector;
     const std::uint32_t tableSectors = (directorySectors + 2 + 1023) / 1024;
-    Bytes file((1 + tableSectors + directorySectors) * std::size_t{4096});
-    std::copy(std::begin(kCompoundMagic), std::end(kCompoundMagic), file.begin());
-    file[28] = 0xFE;
-    file[29] = 0xFF;
-    file[30] = 12;
-    file[32] = 6;
+    Bytes file = FileOf(tableSectors + directorySectors, 12);
     put(file, kTableCountOffset, tableSectors);
     put(file, kFirstDirectoryOffset, tableSectors);
-    put(file, kSmallLimitOffset, kSmallStreamLimit);
-    put(file, kFirstSmallTableOffset, kEndOfChain);
     for (std::uint32_t i = 0; i < tableSectors; ++i) {
         put(file, kTableListOffset + 4 * i, i);
     }
@@ -180,16 +238,9 @@ TEST(CompoundFileReader, WalksAVeryLongChainOfSiblings) {
             last ? kEndOfChain : tableSectors + i + 1);
     }
     for (std::uint32_t i = 0; i <= count; ++i) {
-        const std::size_t at = (tableSectors + 1) * std::size_t{4096} + i * kDirectoryEntrySize;
-        const std::string name = i == 0 ? "Root Entry" : std::to_string(100000 + i);
-        for (std::size_t c = 0; c < name.size(); ++c) {
-            file[at + 2 * c] = static_cast<std::uint8_t>(name[c]);
-        }
-        file[at + 64] = static_cast<std::uint8_t>(2 * name.size() + 2);
-        file[at + 66] = i == 0 ? 5 : 1;
-        put(file, at + kEntryLeftOffset, kFreeSector);
-        put(file, at + kEntryRightOffset, i == 0 || i == count ? kFreeSector : i + 1);
-        put(file, at + kEntryChildOffset, i == 0 ? 1 : kFreeSector);
+        PutEntry(file, (tableSectors + 1) * std::size_t{4096} + i * kDirectoryEntrySize,
+                 i == 0 ? "Root Entry" : std::to_string(100000 + i), i == 0 ? 5 : 1,
+                 i == 0 || i == count ? kFreeSector : i + 1, i == 0 ? 1 : kFreeSector);
     }
     CompoundFileReader reader(file);
     EXPECT_EQ(reader.entry(CompoundFileReader::kRootIndex).contained.size(), count);

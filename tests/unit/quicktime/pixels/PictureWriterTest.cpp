@@ -32,10 +32,11 @@ struct Source {
     bool isInterlaced = false;
     bool isFullRange = false;
     bool isCentred = false;  // chroma, between two pixels
+    int width = kWidth;
 };
 
 void PrintTo(const Source& source, std::ostream* out) {
-    *out << source.name;
+    *out << source.name << ", " << source.width << " wide";
 }
 
 const Source kSources[] = {
@@ -54,6 +55,21 @@ const Source kSources[] = {
     {"gbrp12", AV_PIX_FMT_GBRP12, AVCOL_SPC_RGB, false, true},
     {"rgb48", AV_PIX_FMT_RGB48, AVCOL_SPC_RGB, false, true},
 };
+
+// Lines of one, two and three samples of chroma, where first and last meet.
+std::vector<Source> Narrow() {
+    std::vector<Source> narrow;
+    for (int width = 1; width <= 6; ++width) {
+        narrow.push_back({"yuv420p", AV_PIX_FMT_YUV420P});
+        narrow.push_back(
+            {"yuvj420p centred", AV_PIX_FMT_YUVJ420P, AVCOL_SPC_BT470BG, false, true, true});
+        narrow.push_back({"yuv444p12", AV_PIX_FMT_YUV444P12});
+        for (std::size_t i = narrow.size() - 3; i < narrow.size(); ++i) {
+            narrow[i].width = width;
+        }
+    }
+    return narrow;
+}
 
 // Weights of red, green and blue in luma.
 struct Weights {
@@ -89,7 +105,7 @@ Triple YuvOf(const Triple& rgb, Weights k) {
 host::FrameOwner PictureOf(const Source& source, std::minstd_rand& random) {
     host::FrameOwner frame(av_frame_alloc());
     frame->format = source.format;
-    frame->width = kWidth;
+    frame->width = source.width;
     frame->height = kHeight;
     frame->colorspace = source.matrix;
     frame->interlaced_frame = source.isInterlaced;
@@ -107,7 +123,7 @@ host::FrameOwner PictureOf(const Source& source, std::minstd_rand& random) {
             std::memset(buffer->data, 0, buffer->size);
         }
     }
-    std::vector<std::uint16_t> line(kWidth);
+    std::vector<std::uint16_t> line(source.width);
     for (int i = 0; i < form.nb_components; ++i) {
         const bool isChroma = i == 1 || i == 2;
         const int height = isChroma ? -(-kHeight >> form.log2_chroma_h) : kHeight;
@@ -117,7 +133,7 @@ host::FrameOwner PictureOf(const Source& source, std::minstd_rand& random) {
                     least + static_cast<int>(random() % static_cast<unsigned>(most - least + 1)));
             }
             av_write_image_line2(line.data(), frame->data, frame->linesize, &form, 0, y, i,
-                                 isChroma ? -(-kWidth >> form.log2_chroma_w) : kWidth,
+                                 isChroma ? -(-source.width >> form.log2_chroma_w) : source.width,
                                  sizeof line[0]);
         }
     }
@@ -151,7 +167,7 @@ public:
         }
         const Triple left = Yuv(std::max(x - 1, 0), y, layout);
         const Triple here = Yuv(x, y, layout);
-        const Triple right = Yuv(std::min(x + 1, kWidth - 1), y, layout);
+        const Triple right = Yuv(std::min(x + 1, source_.width - 1), y, layout);
         return {0.0, (left.b + 2.0 * here.b + right.b) / 4.0,
                 (left.c + 2.0 * here.c + right.c) / 4.0};
     }
@@ -164,7 +180,7 @@ private:
 
     double At(int component, int x, int y) const {
         const bool isChroma = component == 1 || component == 2;
-        const int width = isChroma ? -(-kWidth >> form_.log2_chroma_w) : kWidth;
+        const int width = isChroma ? -(-source_.width >> form_.log2_chroma_w) : source_.width;
         const std::uint8_t* planes[4] = {frame_.data[0], frame_.data[1], frame_.data[2],
                                          frame_.data[3]};
         std::uint16_t number = 0;
@@ -229,8 +245,10 @@ private:
 class Written {
 public:
     Written(const AVFrame& frame, PixelLayout layout)
-        : layout_(layout), bytes_(host::PictureBytes(layout, kWidth, kHeight)) {
-        works_ = host::WritePicture(frame, layout, kWidth, kHeight, bytes_.data());
+        : layout_(layout),
+          width_(frame.width),
+          bytes_(host::PictureBytes(layout, width_, kHeight)) {
+        works_ = host::WritePicture(frame, layout, width_, kHeight, bytes_.data());
     }
     bool Works() const { return works_; }
 
@@ -249,9 +267,10 @@ public:
 
 private:
     const std::uint8_t* Line(int y) const {
-        return bytes_.data() + host::LineBytes(layout_, kWidth) * static_cast<std::size_t>(y);
+        return bytes_.data() + host::LineBytes(layout_, width_) * static_cast<std::size_t>(y);
     }
     PixelLayout layout_;
+    int width_;
     std::vector<std::uint8_t> bytes_;
     bool works_;
 };
@@ -264,7 +283,7 @@ protected:
     template <class Number>
     void ExpectHalfChroma(PixelLayout layout, double scale, Number number) {
         for (int y = 0; y < kHeight; ++y) {
-            for (int x = 0; x < kWidth; ++x) {
+            for (int x = 0; x < GetParam().width; ++x) {
                 const Triple chroma = model_.HalfChroma(x - x % 2, y, layout);
                 const double wanted[2] = {128.0 + 224.0 * (x % 2 == 0 ? chroma.b : chroma.c),
                                           16.0 + 219.0 * model_.Yuv(x, y, layout).a};
@@ -299,7 +318,7 @@ TEST_P(PictureWriter, WritesRgbToTheNearestCode) {
     const Written deep(*frame_, PixelLayout::Argb16);
     ASSERT_TRUE(full.Works() && video.Works() && deep.Works());
     for (int y = 0; y < kHeight; ++y) {
-        for (int x = 0; x < kWidth; ++x) {
+        for (int x = 0; x < GetParam().width; ++x) {
             const Triple rgb = model_.Rgb(x, y);
             const double wanted[3] = {rgb.a, rgb.b, rgb.c};
             const auto held = [](double value, double most) {
@@ -323,7 +342,7 @@ TEST_P(PictureWriter, WritesFloatsNearerThanCodesOfSixteenBits) {
     const Written written(*frame_, layout);
     ASSERT_TRUE(written.Works());
     for (int y = 0; y < kHeight; ++y) {
-        for (int x = 0; x < kWidth; ++x) {
+        for (int x = 0; x < GetParam().width; ++x) {
             const Triple yuv = model_.Yuv(x, y, layout);
             const double wanted[4] = {model_.Alpha(x, y), yuv.a * 219.0 / 255.0,
                                       (128.0 + 224.0 * yuv.b) / 255.0,
@@ -337,6 +356,7 @@ TEST_P(PictureWriter, WritesFloatsNearerThanCodesOfSixteenBits) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Sources, PictureWriter, testing::ValuesIn(kSources));
+INSTANTIATE_TEST_SUITE_P(NarrowSources, PictureWriter, testing::ValuesIn(Narrow()));
 
 TEST(PictureWriterOfFloats, WritesWhatIsNoNumberAsBlack) {
     const host::FrameOwner frame(av_frame_alloc());
