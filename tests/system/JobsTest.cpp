@@ -391,8 +391,10 @@ TEST_F(Jobs, RefuseOddNumbers) {
         ExpectSays(RunCliphost("describe a.mov " + std::string(option)), 2,
                    "is not a whole number");
     }
-    ExpectSays(RunCliphost("describe-for-parent"), 2, "use `cliphost describe`");
-    EXPECT_EQ(RunCliphost("--help").out.find("describe-for-parent"), std::string::npos);
+    for (const std::string verb : {"describe", "contact"}) {
+        ExpectSays(RunCliphost(verb + "-for-parent"), 2, "use `cliphost " + verb + "`");
+    }
+    EXPECT_EQ(RunCliphost("--help").out.find("-for-parent"), std::string::npos);
 }
 
 }  // namespace

@@ -75,6 +75,7 @@ MovieAnswer Described() {
     answer.route = "library";
     answer.routeReason = "it is fragmented";
     answer.description = "{\"class\": \"Header\"}";
+    answer.isPartial = true;
     return answer;
 }
 
@@ -95,6 +96,7 @@ TEST(MovieAnswer, ComesBackAsItWas) {
         EXPECT_EQ(got.route, sent.route);
         EXPECT_EQ(got.routeReason, sent.routeReason);
         EXPECT_EQ(got.description, sent.description);
+        EXPECT_TRUE(got.isPartial);
     }
 }
 
