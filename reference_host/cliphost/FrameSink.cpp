@@ -9,6 +9,7 @@
 #include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PixelsToPicture.h"
 #include "reference_host/cliphost/PngFile.h"
+#include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
@@ -16,6 +17,10 @@ namespace cliphost {
 namespace {
 
 using host::DisplayPath;
+
+void WriteRaw(OutputFile& output, const FrameReader& reader) {
+    output.Write(reader.bytes(), static_cast<std::size_t>(reader.frameBytes()));
+}
 
 // Gives the picture that was written.
 Picture WritePng(const std::filesystem::path& file, const FrameReader& reader,
@@ -42,9 +47,14 @@ public:
     explicit RawSink(const std::filesystem::path& file) : file_(file), output_(file) {}
 
     void Take(std::uint64_t, const FrameReader& reader, const FrameReader*) override {
-        output_.Write(reader.bytes(), static_cast<std::size_t>(reader.frameBytes()));
+        WriteRaw(output_, reader);
         ++frames_;
     }
+    void TakeMade(const MadeFrame& made) override {
+        AppendTo(output_, made.file, file_);
+        ++frames_;
+    }
+    std::filesystem::path PlaceOf(std::uint64_t) const override { return file_; }
     void Finish() override { output_.Finish(); }
     std::string Summary() const override {
         return host::system::IsStandardOutput(file_)
@@ -65,15 +75,23 @@ public:
         : file_(std::move(file)), turn_(turn) {}
 
     void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {
-        const Picture picture = WritePng(file_, reader, alpha, turn_);
-        words_ = fmt::format("{}: frame {}, {} x {}", DisplayPath(file_), frame, picture.width,
-                             picture.height);
+        Tell(WriteFrameFile(file_, frame, reader, alpha, turn_, false));
     }
+    void TakeMade(const MadeFrame& made) override {
+        PutIntoPlace(made.file, file_);
+        Tell(made);
+    }
+    std::filesystem::path PlaceOf(std::uint64_t) const override { return file_; }
     void Finish() override {}
     std::string Summary() const override { return words_; }
     bool IsRaw() const override { return false; }
 
 private:
+    void Tell(const MadeFrame& made) {
+        words_ = fmt::format("{}: frame {}, {} x {}", DisplayPath(file_), made.frame, made.width,
+                             made.height);
+    }
+
     std::filesystem::path file_;
     PictureTurn turn_;
     std::string words_;
@@ -85,10 +103,17 @@ public:
         : folder_(std::move(folder)), made_(folder_), stem_(std::move(stem)), turn_(turn) {}
 
     void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) override {
+        WritePng(PlaceOf(frame), reader, alpha, turn_);
+        ++frames_;
+    }
+    void TakeMade(const MadeFrame& made) override {
+        PutIntoPlace(made.file, PlaceOf(made.frame));
+        ++frames_;
+    }
+    std::filesystem::path PlaceOf(std::uint64_t frame) const override {
         std::filesystem::path name = stem_;
         name += fmt::format("_{:06}.png", frame);
-        WritePng(folder_ / name, reader, alpha, turn_);
-        ++frames_;
+        return folder_ / name;
     }
     void Finish() override {}
     std::string Summary() const override {
@@ -105,6 +130,19 @@ private:
 };
 
 }  // namespace
+
+MadeFrame WriteFrameFile(const std::filesystem::path& file, std::uint64_t frame,
+                         const FrameReader& reader, const FrameReader* alpha,
+                         const PictureTurn& turn, bool isRaw) {
+    if (isRaw) {
+        OutputFile output(file);
+        WriteRaw(output, reader);
+        output.Finish();
+        return {frame, file, reader.width(), reader.height()};
+    }
+    const Picture picture = WritePng(file, reader, alpha, turn);
+    return {frame, file, picture.width, picture.height};
+}
 
 std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
                                          const std::filesystem::path& movie, bool isOneFrame,

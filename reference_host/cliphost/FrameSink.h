@@ -12,12 +12,29 @@
 
 namespace cliphost {
 
+// A frame that a child process made a file of.
+struct MadeFrame {
+    std::uint64_t frame = 0;
+    std::filesystem::path file;  // gone once it is taken
+    int width = 0;
+    int height = 0;
+};
+
+// Writes a frame as a file: a turned PNG picture, or the bytes as they are delivered. Gives its
+// width and height.
+MadeFrame WriteFrameFile(const std::filesystem::path& file, std::uint64_t frame,
+                         const FrameReader& reader, const FrameReader* alpha,
+                         const PictureTurn& turn, bool isRaw);
+
 // Where frames go: each is taken right after it was read.
 class FrameSink {
 public:
     virtual ~FrameSink() = default;
     // `alpha` holds the same frame of the alpha track, or is null.
     virtual void Take(std::uint64_t frame, const FrameReader& reader, const FrameReader* alpha) = 0;
+    // Throws a Failure when it left no file.
+    virtual void TakeMade(const MadeFrame& made) = 0;
+    virtual std::filesystem::path PlaceOf(std::uint64_t frame) const = 0;
     virtual void Finish() = 0;
     // A line for the user once all is there.
     virtual std::string Summary() const = 0;

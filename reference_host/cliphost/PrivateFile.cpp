@@ -12,6 +12,17 @@
 namespace cliphost {
 namespace {
 
+// Nothing but a file of its own: a link would lead to somebody else's.
+void NeedOwnFile(const std::filesystem::path& file, const std::filesystem::path& place) {
+    std::error_code ignored;
+    if (std::filesystem::symlink_status(file, ignored).type() !=
+            std::filesystem::file_type::regular ||
+        std::filesystem::hard_link_count(file, ignored) != 1) {
+        throw Failure(kExitFile, place,
+                      "not written: the process that read the movie left no file");
+    }
+}
+
 void CopyInto(OutputFile& output, const std::filesystem::path& file) {
     std::ifstream from(file, std::ios::binary);
     char piece[65536];
@@ -27,14 +38,8 @@ std::filesystem::path PrivateFile(const std::filesystem::path& folder, std::uint
 }
 
 void PutIntoPlace(const std::filesystem::path& file, const std::filesystem::path& place) {
+    NeedOwnFile(file, place);
     std::error_code error;
-    // Nothing but a file of its own: a link would lead to somebody else's.
-    if (std::filesystem::symlink_status(file, error).type() !=
-            std::filesystem::file_type::regular ||
-        std::filesystem::hard_link_count(file, error) != 1) {
-        throw Failure(kExitFile, place,
-                      "not written: the process that read the movie left no file");
-    }
     OutputFile output(place, OutputFile::Writer::Other);
     if (OutputFile::IsDevice(place)) {
         CopyInto(output, file);
@@ -51,6 +56,14 @@ void PutIntoPlace(const std::filesystem::path& file, const std::filesystem::path
         }
     }
     output.Finish();
+}
+
+void AppendTo(OutputFile& output, const std::filesystem::path& file,
+              const std::filesystem::path& place) {
+    NeedOwnFile(file, place);
+    CopyInto(output, file);
+    std::error_code ignored;
+    std::filesystem::remove(file, ignored);
 }
 
 }  // namespace cliphost

@@ -30,26 +30,37 @@ void AppendGiven(const CLI::App& app, const CLI::App& other, std::vector<std::st
 
 }  // namespace
 
-void AddWorkerOptions(CLI::App& verb, WorkerCall& call) {
-    const char* const group = "Many movies at once";
+const WorkerWords kManyMovies = {
+    "Many movies at once",
+    "How many movies are read at the same time, each by a process that can do little else; what "
+    "one does to its process costs that movie alone. With 1, and for a single movie, this process "
+    "reads",
+    "Give a movie up that takes longer; movies are then read by such processes, whatever --jobs is",
+    "Give a movie up whose process needs more MiB of memory, the program's own included; the same "
+    "holds"};
+
+const WorkerWords kManyFrames = {
+    "Many frames at once",
+    "How many processes that can do little else read pieces of the range at the same time; what "
+    "the movie does to one costs that piece alone. With 1, for fewer than 24 frames, and where "
+    "the output is a pipe or a device, this process reads",
+    "Give a piece of the range up that takes longer; frames are then read by such processes, "
+    "whatever --jobs and the output are",
+    "Give a piece up whose process needs more MiB of memory, the program's own included; the same "
+    "holds"};
+
+void AddWorkerOptions(CLI::App& verb, WorkerCall& call, const WorkerWords& words) {
     call.jobs = host::system::UsableProcessors();
-    verb.add_option("--jobs", call.jobs,
-                    "How many movies are read at the same time, each by a process that can do "
-                    "little else; what one does to its process costs that movie alone. With 1, "
-                    "and for a single movie, this process reads")
+    verb.add_option("--jobs", call.jobs, words.jobs)
         ->check(WholeNumber(1, kMostJobs))
         ->default_str("one for each processor")
-        ->group(group);
-    verb.add_option("--limit-seconds", call.limits.seconds,
-                    "Give a movie up that takes longer; movies are then read by such processes, "
-                    "whatever --jobs is")
+        ->group(words.group);
+    verb.add_option("--limit-seconds", call.limits.seconds, words.seconds)
         ->check(WholeNumber(1, kMostSeconds))
-        ->group(group);
-    verb.add_option("--limit-memory", call.limits.mebibytes,
-                    "Give a movie up whose process needs more MiB of memory, the program's own "
-                    "included; the same holds")
+        ->group(words.group);
+    verb.add_option("--limit-memory", call.limits.mebibytes, words.memory)
         ->check(WholeNumber(kLeastMebibytes, kMostMebibytes))
-        ->group(group);
+        ->group(words.group);
 }
 
 void TakeWorkerVerb(CLI::App& app, const CLI::App& verb, const std::string& worker,

@@ -17,11 +17,12 @@ MovieAnswer Failed(int status, Problem problem) {
     return answer;
 }
 
-// One movie's answer, whatever happens to it.
-MovieAnswer AnswerSafely(const std::filesystem::path& movie, const PlaceOfFile& place,
-                         const AnswerToMovie& answer) {
+}  // namespace
+
+MovieAnswer AnswerSafely(const std::filesystem::path& movie,
+                         const std::function<MovieAnswer()>& answer) {
     try {
-        return answer(movie, place);
+        return answer();
     } catch (const Failure& failure) {
         return Failed(failure.status(), failure.problem());
     } catch (const host::MovieLibraryMissing& missing) {
@@ -32,8 +33,6 @@ MovieAnswer AnswerSafely(const std::filesystem::path& movie, const PlaceOfFile& 
     }
 }
 
-}  // namespace
-
 CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker) {
     CLI::App* const verb = app.add_subcommand(worker->name, "Work for another cliphost");
     verb->group("");  // not for users
@@ -43,21 +42,25 @@ CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker
     return verb;
 }
 
-void ServeMovies(Session& session, const WorkerVerb& worker, const AnswerToMovie& answer) {
+void Serve(Session& session, const WorkerVerb& worker,
+           const std::function<std::string(std::uint64_t, const std::string&)>& answer) {
     // Loads the multimedia library, which can't be done later.
     host::Ref<QuickTime::IQuickTimeProperty> property;
     session.host().Create(QuickTime::CompID_QuickTimeProperty, property);
-    const auto serve = [&](std::uint64_t number, const std::string& movie) {
+    if (!ServeAsWorker(worker.folder, answer)) {
+        throw Failure(kExitCaller, worker.name, "only cliphost itself starts this",
+                      "use `cliphost " + worker.users + "`");
+    }
+}
+
+void ServeMovies(Session& session, const WorkerVerb& worker, const AnswerToMovie& answer) {
+    Serve(session, worker, [&](std::uint64_t number, const std::string& movie) {
         const PlaceOfFile place = [&] {
             return worker.folder.empty() ? std::filesystem::path()
                                          : PrivateFile(worker.folder, number);
         };
-        return ToBytes(AnswerSafely(movie, place, answer));
-    };
-    if (!ServeAsWorker(worker.folder, serve)) {
-        throw Failure(kExitCaller, worker.name, "only cliphost itself starts this",
-                      "use `cliphost " + worker.users + "`");
-    }
+        return ToBytes(AnswerSafely(movie, [&] { return answer(movie, place); }));
+    });
 }
 
 }  // namespace cliphost

@@ -19,12 +19,20 @@ struct WorkerVerb {
 // Adds it, with its folder as an option and hidden from users; both share `worker`.
 CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker);
 
+// Answers the parent's requests, which come with their number. Throws a Failure when no parent
+// started this process.
+void Serve(Session& session, const WorkerVerb& worker,
+           const std::function<std::string(std::uint64_t, const std::string&)>& answer);
+
+// One movie's answer, whatever happens to it.
+MovieAnswer AnswerSafely(const std::filesystem::path& movie,
+                         const std::function<MovieAnswer()>& answer);
+
 // Makes of one movie what the verb makes, and saves it where the place says.
 using AnswerToMovie =
     std::function<MovieAnswer(const std::filesystem::path& movie, const PlaceOfFile& place)>;
 
-// Answers the parent's requests, each a movie's path, whatever happens to one. Throws a Failure
-// when no parent started this process.
+// Serves requests that are each a movie's path.
 void ServeMovies(Session& session, const WorkerVerb& worker, const AnswerToMovie& answer);
 
 }  // namespace cliphost

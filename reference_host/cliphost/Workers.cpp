@@ -29,8 +29,6 @@ using Clock = std::chrono::steady_clock;
 // Between what the process writes on standard error for one movie and for the next.
 constexpr char kEndOfMovie = '\0';
 constexpr std::size_t kMostTold = std::size_t{16} << 20;
-// Results that wait for one before them; more movies are not begun.
-constexpr std::size_t kMostWaiting = 256;
 // What lies ready for a process is to last so long, and is no more than so many requests.
 constexpr Clock::duration kTimeAhead = std::chrono::milliseconds(10);
 constexpr int kMostAhead = 32;
@@ -194,7 +192,7 @@ std::optional<std::size_t> Run::NextRequest() {
         again_.pop_front();
         return request;
     }
-    if (next_ == requests_.size() || next_ - taken_ >= kMostWaiting) {
+    if (next_ == requests_.size() || next_ - taken_ >= call_.mostWaiting) {
         return std::nullopt;
     }
     client_.Begin(next_);

@@ -31,6 +31,8 @@ struct WorkerCall {
     // nothing.
     std::filesystem::path writeNear;
     int verbosity = 0;
+    // Results that wait for one before them; no more requests are begun than that.
+    std::size_t mostWaiting = 256;
 };
 
 // What became of one request.

@@ -1,14 +1,17 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-// `--jobs` of the verbs that take several movies: the same results as from one process, and what a
-// movie does to the process that reads it costs that movie alone.
+// `--jobs` of the verbs that take several movies or ranges of frames: the same results as from one
+// process, and what a movie does to the process that reads it costs that movie, or that piece of
+// the range, alone.
 
 #include <signal.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <chrono>
+#include <cstdlib>
+#include <map>
 #include <nlohmann/json.hpp>
 #include <thread>
 
@@ -22,11 +25,6 @@ using namespace std::chrono_literals;
 
 std::string Program() {
     return Quoted(ProgramFolder() / "cliphost");
-}
-
-// Standard output alone.
-CommandResult RunQuietly(const std::string& arguments) {
-    return RunCommand(Program() + " " + arguments + " 2>/dev/null");
 }
 
 std::size_t CountOf(const std::string& text, const std::string& words) {
@@ -385,13 +383,176 @@ TEST_F(Jobs, EndWithTheProgram) {
     }
 }
 
+// A movie of 96 frames, large enough for a range of them to be read in pieces of a dozen or two.
+class JobsOfFrames : public EqualJobs {
+protected:
+    std::filesystem::path Movie(const std::string& name, const std::string& codec) {
+        return Make("-f lavfi -i testsrc2=size=640x360:rate=24:duration=4 " + codec, "in/" + name);
+    }
+    // What a call leaves: what it prints, and all files at the place of its output.
+    struct Left {
+        Printed printed;
+        std::map<std::string, movies::Bytes> files;
+    };
+    Left Run(const std::string& call, const std::string& name) {
+        const auto out = folder() / "out";
+        std::filesystem::remove_all(out);
+        std::filesystem::create_directories(out);
+        setenv("TMPDIR", (folder() / "tmp").c_str(), 1);
+        Left left{Print("-v frame " + call + " -o " + Quoted(out / name)), {}};
+        unsetenv("TMPDIR");
+        for (const auto& entry : std::filesystem::recursive_directory_iterator(out)) {
+            if (entry.is_regular_file()) {
+                left.files[std::filesystem::relative(entry.path(), out)] = ReadFile(entry.path());
+            }
+        }
+        EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+        EXPECT_LE(NamesIn(out).size(), 1u);
+        return left;
+    }
+    // Gives what one process leaves.
+    Left ExpectTheSame(const std::string& call, const std::string& name,
+                       const std::vector<std::string>& others) {
+        SCOPED_TRACE(call);
+        const Left one = Run(call + " --jobs 1", name);
+        for (const std::string& other : others) {
+            SCOPED_TRACE(other);
+            const Left several = Run(call + other, name);
+            EXPECT_EQ(several.printed.status, one.printed.status);
+            EXPECT_EQ(several.printed.out, one.printed.out);
+            EXPECT_EQ(several.printed.told, one.printed.told);
+            EXPECT_TRUE(several.files == one.files);
+        }
+        return one;
+    }
+};
+
+const std::string kProRes = "-c:v prores_ks -profile:v 0";
+const std::vector<std::string> kSeveral = {" --jobs 2", " --jobs 5",
+                                           " --jobs 1 --limit-seconds 100"};
+
+TEST_F(JobsOfFrames, WriteTheSamePicturesAndBytes) {
+    const std::string movie = Quoted(Movie("p.mov", kProRes));
+    EXPECT_EQ(ExpectTheSame(movie + " --range 0:", "pictures", kSeveral).files.size(), 96u);
+    const Left raw = ExpectTheSame(movie + " --range 0:", "a.raw", kSeveral);
+    EXPECT_EQ(raw.files.at("a.raw").size(), 96u * 640 * 360 * 2);
+    EXPECT_NE(raw.printed.told.find("-pixel_format"), std::string::npos);
+    EXPECT_NE(raw.printed.out.find("96 raw frames"), std::string::npos);
+    EXPECT_EQ(ExpectTheSame(movie + " --range 3:90:3", "pictures", kSeveral).files.size(), 29u);
+}
+
+// Its pictures lie far from those that stand alone, and are stored in another order than shown.
+TEST_F(JobsOfFrames, WriteTheSameOfAMovieOfLongGroups) {
+    const std::string movie =
+        Quoted(Movie("long.mov", "-c:v libx264 -pix_fmt yuv420p -bf 2 -g 40 -sc_threshold 0"));
+    EXPECT_EQ(ExpectTheSame(movie + " --range 5:", "a.raw", kSeveral).files.at("a.raw").size(),
+              91u * 640 * 360 * 2);
+}
+
+TEST_F(JobsOfFrames, TellFramesThatCantBeReadInOrder) {
+    const auto cut = Movie("cut.mov", kProRes + " -movflags +faststart");
+    std::filesystem::resize_file(cut, std::filesystem::file_size(cut) * 2 / 3);
+    for (const char* const name : {"pictures", "a.raw"}) {
+        const Left left = ExpectTheSame(Quoted(cut) + " --range 20:", name, kSeveral);
+        EXPECT_EQ(left.printed.status, 1);
+        EXPECT_NE(left.printed.told.find("frame 95 is left out: "), std::string::npos);
+        EXPECT_FALSE(left.files.empty());
+    }
+}
+
+TEST_F(JobsOfFrames, RefuseTheSame) {
+    const std::string movie = Quoted(Movie("p.mov", kProRes));
+    for (const char* const rest :
+         {" --range 96:200", " --range 0: --format odd", " --range 0: --track 7"}) {
+        const Left left = ExpectTheSame(movie + rest, "pictures", kSeveral);
+        EXPECT_EQ(left.printed.status, 2);
+        EXPECT_TRUE(left.files.empty());
+    }
+    EXPECT_EQ(ExpectTheSame(In("absent.mov") + " --range 0:", "a.raw", kSeveral).printed.status, 2);
+    EXPECT_EQ(ExpectTheSame(movie + " --range 0:", "a.png", kSeveral).printed.status, 2);
+    std::filesystem::create_directories(folder() / "out" / "a.raw");
+    EXPECT_EQ(ExpectTheSame(movie + " --range 0:", "no/a.raw", kSeveral).printed.status, 2);
+}
+
+TEST_F(JobsOfFrames, ProtectASingleFrameWhereALimitIsGiven) {
+    const std::string turned = Quoted(MadeMovie("rotated_90.mov")) + " --frame 2";
+    const Left left = ExpectTheSame(turned, "a.png", {" --limit-seconds 100"});
+    EXPECT_EQ(left.files.size(), 1u);
+    EXPECT_NE(left.printed.out.find("frame 2, "), std::string::npos);
+}
+
+TEST_F(JobsOfFrames, ComeInOrderThroughAPipe) {
+    const std::string call =
+        Program() + " frame " + Quoted(Movie("p.mov", kProRes)) + " --range 0:60 -o - 2>/dev/null";
+    ASSERT_EQ(RunCommand(call + " --jobs 1 >" + In("one")).status, 0);
+    for (const char* const several : {" --jobs 2", " --jobs 2 --limit-seconds 100"}) {
+        ASSERT_EQ(RunCommand(call + several + " | cat >" + In("piped")).status, 0);
+        EXPECT_TRUE(ReadFile(folder() / "piped") == ReadFile(folder() / "one")) << several;
+    }
+    EXPECT_EQ(ReadFile(folder() / "one").size(), 60u * 640 * 360 * 2);
+}
+
+// One of four pieces is lost, whole.
+TEST_F(JobsOfFrames, LoseOnePieceToACrashOrATooLongWait) {
+    const auto movie = Movie("p.mov", kProRes);
+    const std::string call = " --range 0:48 --jobs 2 --limit-seconds 4 -o ";
+    const std::pair<const char*, const char*> harms[] = {
+        {"crash-at-13.mov", "the process that read it was ended by signal 11"},
+        {"leave-at-23.mov", "the process that read it ended with status 3 and without an answer"},
+        {"hang-at-12.mov", "took longer than 4 seconds"}};
+    const auto whole = folder() / "whole.raw";
+    ASSERT_EQ(RunCliphost("frame " + Quoted(movie) + " --range 0:48 -o " + Quoted(whole)).status,
+              0);
+    movies::Bytes rest = ReadFile(whole);
+    const std::ptrdiff_t piece = 12 * 640 * 360 * 2;
+    rest.erase(rest.begin() + piece, rest.begin() + 2 * piece);
+    for (const auto& [name, why] : harms) {
+        SCOPED_TRACE(name);
+        std::filesystem::copy_file(movie, folder() / "in" / name);
+        const std::string line = Line(name, std::string("frames 12 to 23 are left out: ") + why);
+        ExpectSays(Harmed("frame " + In("in/" + std::string(name)) + call + In("pictures")), 1,
+                   line + (folder() / "pictures").string() + ": 36 pictures\n");
+        const auto pictures = NamesIn(folder() / "pictures");
+        EXPECT_EQ(pictures.size(), 36u);
+        const std::string stem = std::filesystem::path(name).stem();
+        EXPECT_EQ(pictures.count(stem + "_000011.png"), 1u);
+        EXPECT_EQ(pictures.count(stem + "_000012.png"), 0u);
+        EXPECT_EQ(pictures.count(stem + "_000024.png"), 1u);
+        ExpectSays(Harmed("frame " + In("in/" + std::string(name)) + call + In("a.raw")), 1, line);
+        EXPECT_TRUE(ReadFile(folder() / "a.raw") == rest);
+        EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+        std::filesystem::remove_all(folder() / "pictures");
+    }
+}
+
+TEST_F(JobsOfFrames, LoseAMovieThatBreaksItsFirstReader) {
+    std::filesystem::copy_file(Movie("p.mov", kProRes), folder() / "in/crash.mov");
+    ExpectSays(Harmed("frame " + In("in/crash.mov") + " --range 0: --jobs 2 -o " + In("a.raw")), 1,
+               Line("crash.mov", "the process that read it was ended by signal 11"));
+    EXPECT_FALSE(std::filesystem::exists(folder() / "a.raw"));
+}
+
+TEST_F(JobsOfFrames, WriteNothingButTheirOwnFolder) {
+    std::filesystem::copy_file(Movie("p.mov", kProRes), folder() / "in/probe-at-30.mov");
+    const CommandResult ran = Harmed("-v frame " + In("in/probe-at-30.mov") +
+                                     " --range 0: --jobs 2 -o " + In("pictures"));
+    if (ran.out.find("Landlock") != std::string::npos) {
+        GTEST_SKIP() << "the system has no Landlock";
+    }
+    for (const char* const what : {"socket", "process", "program", "writing the movie",
+                                   "a file beside it", "removing the movie"}) {
+        ExpectSays(ran, 0, std::string(what) + ": refused\n");
+    }
+    EXPECT_EQ(NamesIn(folder() / "pictures").size(), 96u);
+}
+
 TEST_F(Jobs, RefuseOddNumbers) {
     for (const char* const option :
          {"--jobs 0", "--jobs x", "--jobs 1.5", "--limit-seconds 0", "--limit-memory 10"}) {
         ExpectSays(RunCliphost("describe a.mov " + std::string(option)), 2,
                    "is not a whole number");
     }
-    for (const std::string verb : {"describe", "contact"}) {
+    for (const std::string verb : {"describe", "contact", "frame"}) {
         ExpectSays(RunCliphost(verb + "-for-parent"), 2, "use `cliphost " + verb + "`");
     }
     EXPECT_EQ(RunCliphost("--help").out.find("-for-parent"), std::string::npos);
