@@ -431,6 +431,8 @@ const std::string kProRes = "-c:v prores_ks -profile:v 0";
 const std::vector<std::string> kSeveral = {" --jobs 2", " --jobs 5",
                                            " --jobs 1 --limit-seconds 100"};
 
+const std::vector<std::string> kTwo = {" --jobs 2"};
+
 TEST_F(JobsOfFrames, WriteTheSamePicturesAndBytes) {
     const std::string movie = Quoted(Movie("p.mov", kProRes));
     EXPECT_EQ(ExpectTheSame(movie + " --range 0:", "pictures", kSeveral).files.size(), 96u);
@@ -438,7 +440,7 @@ TEST_F(JobsOfFrames, WriteTheSamePicturesAndBytes) {
     EXPECT_EQ(raw.files.at("a.raw").size(), 96u * 640 * 360 * 2);
     EXPECT_NE(raw.printed.told.find("-pixel_format"), std::string::npos);
     EXPECT_NE(raw.printed.out.find("96 raw frames"), std::string::npos);
-    EXPECT_EQ(ExpectTheSame(movie + " --range 3:90:3", "pictures", kSeveral).files.size(), 29u);
+    EXPECT_EQ(ExpectTheSame(movie + " --range 3:90:3", "pictures", kTwo).files.size(), 29u);
 }
 
 // Its pictures lie far from those that stand alone, and are stored in another order than shown.
@@ -464,13 +466,12 @@ TEST_F(JobsOfFrames, RefuseTheSame) {
     const std::string movie = Quoted(Movie("p.mov", kProRes));
     for (const char* const rest :
          {" --range 96:200", " --range 0: --format odd", " --range 0: --track 7"}) {
-        const Left left = ExpectTheSame(movie + rest, "pictures", kSeveral);
+        const Left left = ExpectTheSame(movie + rest, "pictures", kTwo);
         EXPECT_EQ(left.printed.status, 2);
         EXPECT_TRUE(left.files.empty());
     }
-    EXPECT_EQ(ExpectTheSame(In("absent.mov") + " --range 0:", "a.raw", kSeveral).printed.status, 2);
-    EXPECT_EQ(ExpectTheSame(movie + " --range 0:", "a.png", kSeveral).printed.status, 2);
-    std::filesystem::create_directories(folder() / "out" / "a.raw");
+    EXPECT_EQ(ExpectTheSame(In("absent.mov") + " --range 0:", "a.raw", kTwo).printed.status, 2);
+    EXPECT_EQ(ExpectTheSame(movie + " --range 0:", "a.png", kTwo).printed.status, 2);
     EXPECT_EQ(ExpectTheSame(movie + " --range 0:", "no/a.raw", kSeveral).printed.status, 2);
 }
 
@@ -492,6 +493,28 @@ TEST_F(JobsOfFrames, ComeInOrderThroughAPipe) {
     EXPECT_EQ(ReadFile(folder() / "one").size(), 60u * 640 * 360 * 2);
 }
 
+TEST_F(JobsOfFrames, EndWhenTheReaderOfTheirOutputHasEnough) {
+    const std::string call = Program() + " frame " + Quoted(Movie("p.mov", kProRes)) +
+                             " --range 0: --limit-seconds 100 -o - 2>" + In("told");
+    RunCommand("TMPDIR=" + In("tmp") + "; export TMPDIR; { " + call + "; echo $? >" + In("status") +
+               "; } | head -c 100 >" + In("some"));
+    EXPECT_EQ(ReadFile(folder() / "status"), (movies::Bytes{'0', '\n'}));
+    EXPECT_EQ(CountOf(RunCommand("cat " + In("told")).out, "cliphost: "), 0u);
+    EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+}
+
+TEST_F(JobsOfFrames, StopAtAPictureThatCantBeWritten) {
+    const std::string movie = Quoted(Movie("p.mov", kProRes));
+    for (const char* const jobs : {"1", "2"}) {
+        const auto out = folder() / jobs;
+        std::filesystem::create_directories(out / "p_000030.png");
+        ExpectSays(
+            RunCliphost("frame " + movie + " --range 0: -o " + Quoted(out) + " --jobs " + jobs), 2,
+            (out / "p_000030.png").string() + ": not written: Is a directory");
+        EXPECT_EQ(NamesIn(out).size(), 31u) << jobs;
+    }
+}
+
 // One of four pieces is lost, whole.
 TEST_F(JobsOfFrames, LoseOnePieceToACrashOrATooLongWait) {
     const auto movie = Movie("p.mov", kProRes);
@@ -499,30 +522,33 @@ TEST_F(JobsOfFrames, LoseOnePieceToACrashOrATooLongWait) {
     const std::pair<const char*, const char*> harms[] = {
         {"crash-at-13.mov", "the process that read it was ended by signal 11"},
         {"leave-at-23.mov", "the process that read it ended with status 3 and without an answer"},
+        {"nonsense-at-14.mov", "the process that read it gave an answer that is none"},
         {"hang-at-12.mov", "took longer than 4 seconds"}};
-    const auto whole = folder() / "whole.raw";
-    ASSERT_EQ(RunCliphost("frame " + Quoted(movie) + " --range 0:48 -o " + Quoted(whole)).status,
-              0);
-    movies::Bytes rest = ReadFile(whole);
-    const std::ptrdiff_t piece = 12 * 640 * 360 * 2;
-    rest.erase(rest.begin() + piece, rest.begin() + 2 * piece);
     for (const auto& [name, why] : harms) {
         SCOPED_TRACE(name);
-        std::filesystem::copy_file(movie, folder() / "in" / name);
-        const std::string line = Line(name, std::string("frames 12 to 23 are left out: ") + why);
-        ExpectSays(Harmed("frame " + In("in/" + std::string(name)) + call + In("pictures")), 1,
-                   line + (folder() / "pictures").string() + ": 36 pictures\n");
-        const auto pictures = NamesIn(folder() / "pictures");
-        EXPECT_EQ(pictures.size(), 36u);
         const std::string stem = std::filesystem::path(name).stem();
+        std::filesystem::copy_file(movie, folder() / "in" / name);
+        ExpectSays(Harmed("frame " + In("in/" + std::string(name)) + call + In(stem)), 1,
+                   Line(name, std::string("frames 12 to 23 are left out: ") + why) +
+                       (folder() / stem).string() + ": 36 pictures\n");
+        const auto pictures = NamesIn(folder() / stem);
+        EXPECT_EQ(pictures.size(), 36u);
         EXPECT_EQ(pictures.count(stem + "_000011.png"), 1u);
         EXPECT_EQ(pictures.count(stem + "_000012.png"), 0u);
         EXPECT_EQ(pictures.count(stem + "_000024.png"), 1u);
-        ExpectSays(Harmed("frame " + In("in/" + std::string(name)) + call + In("a.raw")), 1, line);
-        EXPECT_TRUE(ReadFile(folder() / "a.raw") == rest);
         EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
-        std::filesystem::remove_all(folder() / "pictures");
     }
+}
+
+TEST_F(JobsOfFrames, LeaveALostPieceOutOfRawFrames) {
+    const auto movie = Movie("crash-at-13.mov", kProRes);
+    const std::string call = "frame " + Quoted(movie) + " --range 0:48 --jobs 2 -o ";
+    ASSERT_EQ(RunCliphost(call + In("whole.raw")).status, 0);
+    movies::Bytes rest = ReadFile(folder() / "whole.raw");
+    const std::ptrdiff_t piece = 12 * 640 * 360 * 2;
+    rest.erase(rest.begin() + piece, rest.begin() + 2 * piece);
+    ExpectSays(Harmed(call + In("a.raw")), 1, "frames 12 to 23 are left out: ");
+    EXPECT_TRUE(ReadFile(folder() / "a.raw") == rest);
 }
 
 TEST_F(JobsOfFrames, LoseAMovieThatBreaksItsFirstReader) {

@@ -52,11 +52,25 @@ TEST_F(PrivateFiles, AreFilesOfTheirOwn) {
     std::filesystem::create_symlink(secret, folder() / "link");
     std::filesystem::create_hard_link(secret, folder() / "second name");
     std::filesystem::create_directory(folder() / "folder");
+    OutputFile whole(folder() / "whole");
     for (const char* const name : {"link", "second name", "folder", "absent"}) {
         EXPECT_THROW(PutIntoPlace(folder() / name, place), Failure) << name;
+        EXPECT_THROW(AppendTo(whole, folder() / name, place), Failure) << name;
         EXPECT_EQ(Read(place), "old") << name;
     }
     EXPECT_EQ(Read(secret), "text");
+    whole.Finish();
+    EXPECT_EQ(Read(folder() / "whole"), "");
+}
+
+TEST_F(PrivateFiles, AreAppendedToOne) {
+    OutputFile whole(folder() / "whole");
+    AppendTo(whole, Write("0", "first, "), folder() / "whole");
+    AppendTo(whole, Write("1", "second"), folder() / "whole");
+    whole.Finish();
+    EXPECT_EQ(Read(folder() / "whole"), "first, second");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "0"));
+    EXPECT_FALSE(std::filesystem::exists(folder() / "1"));
 }
 
 TEST_F(PrivateFiles, AreCopiedFromAnotherFileSystem) {
