@@ -144,6 +144,10 @@ MadeFrame WriteFrameFile(const std::filesystem::path& file, std::uint64_t frame,
     return {frame, file, picture.width, picture.height};
 }
 
+bool IsRawFile(const std::filesystem::path& output) {
+    return output.extension() == ".raw";
+}
+
 std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
                                          const std::filesystem::path& movie, bool isOneFrame,
                                          const PictureTurn& turn) {
@@ -153,7 +157,7 @@ std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
     if (std::filesystem::is_directory(output, ignored)) {
         return std::make_unique<FolderSink>(output, movie.stem(), turn);
     }
-    if (host::system::DescriptorOf(output) || ending == ".raw" ||
+    if (host::system::DescriptorOf(output) || IsRawFile(output) ||
         (OutputFile::IsDevice(output) && ending != ".png")) {
         return std::make_unique<RawSink>(output);
     }

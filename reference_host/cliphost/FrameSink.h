@@ -41,6 +41,9 @@ public:
     virtual bool IsRaw() const = 0;
 };
 
+// Whether a path names a file for raw frames.
+bool IsRawFile(const std::filesystem::path& output);
+
 // The sink that a path asks for: "-", devices and FILE.raw take the bytes as they
 // are delivered, one frame behind the other; FILE.png takes one frame; a folder
 // takes a PNG for each, named after the movie and the frame, and is made when

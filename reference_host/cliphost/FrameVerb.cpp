@@ -13,12 +13,14 @@ namespace {
 // Processes take longer to start than fewer frames to read.
 constexpr std::uint64_t kManyFramesFrom = 24;
 
-// What comes through a pipe is wanted as it is read, and a piece is whole at its end alone.
-bool IsForWorkers(const FrameOptions& options, const WantedFrames& wanted) {
+// What comes through a pipe is wanted as it is read, and a piece is whole at its end alone. Raw
+// frames are hardly more than decoded, and most decoders have threads of their own.
+bool IsForWorkers(const FrameOptions& options, const WantedFrames& wanted, bool areJobsGiven) {
     const WorkerCall& call = options.workers;
     const std::uint64_t most = wanted.range.CountIn(std::numeric_limits<std::uint64_t>::max());
     return call.limits.AreSet() ||
-           (call.jobs > 1 && most >= kManyFramesFrom && !OutputFile::IsDevice(options.output));
+           (call.jobs > 1 && most >= kManyFramesFrom && !OutputFile::IsDevice(options.output) &&
+            (areJobsGiven || !IsRawFile(options.output)));
 }
 
 void AddFrameForParent(CLI::App& app, const SessionOptions& session, int& status) {
@@ -63,7 +65,7 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
     AddFrameForParent(app, session, status);
     verb->callback([&app, verb, &session, &status, options] {
         const WantedFrames wanted = options->Wanted();
-        if (!IsForWorkers(*options, wanted)) {
+        if (!IsForWorkers(*options, wanted, verb->count("--jobs") > 0)) {
             status = WriteFramesHere(session, *options, wanted);
             return;
         }
