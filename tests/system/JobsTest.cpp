@@ -540,6 +540,16 @@ TEST_F(JobsOfFrames, LoseOnePieceToACrashOrATooLongWait) {
     }
 }
 
+// Otherwise the pictures before them would be decoded twice.
+TEST_F(JobsOfFrames, AreInPiecesThatBeginWithAPictureThatStandsAlone) {
+    const auto movie =
+        Movie("crash-at-50.mov", "-c:v libx264 -pix_fmt yuv420p -bf 2 -g 40 -sc_threshold 0");
+    ExpectSays(
+        Harmed("frame " + Quoted(movie) + " --range 0: --jobs 2 -o " + In("a.raw")), 1,
+        Line("crash-at-50.mov",
+             "frames 40 to 79 are left out: the process that read it was ended by signal 11"));
+}
+
 TEST_F(JobsOfFrames, LeaveALostPieceOutOfRawFrames) {
     const auto movie = Movie("crash-at-13.mov", kProRes);
     const std::string call = "frame " + Quoted(movie) + " --range 0:48 --jobs 2 -o ";
