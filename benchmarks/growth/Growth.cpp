@@ -196,11 +196,13 @@ double SecondsOfStart(const Work& work) {
 }
 
 void Run(benchmark::State& state, const Work& work) {
-    // Of a brief run nothing else would be left.
-    const double start = Sized(true, false) ? SecondsOfStart(work) : 0.0;
     const Arguments command = CommandOf(work, state.range(0));
-    // Memory that the machine hands out for the first time would be laid to the size.
-    SecondsOf(command, work.status);
+    double start = 0.0;
+    if (Sized(true, false)) {  // of a brief run nothing else would be left
+        start = SecondsOfStart(work);
+        // Memory that the machine hands out for the first time would be laid to the size.
+        SecondsOf(command, work.status);
+    }
     for (auto _ : state) {
         const double seconds = SecondsOf(command, work.status);
         if (seconds < 0 || start < 0) {
