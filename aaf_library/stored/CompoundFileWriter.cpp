@@ -26,10 +26,6 @@ void CheckName(const std::u16string& name) {
     }
 }
 
-std::uint32_t NumberIn(const std::uint8_t* at) {
-    return at[0] | at[1] << 8 | at[2] << 16 | std::uint32_t{at[3]} << 24;
-}
-
 Bytes NumberBytes(const std::vector<std::uint32_t>& numbers) {
     Bytes bytes(numbers.size() * 4);
     std::uint8_t* at = bytes.data();
