@@ -67,7 +67,7 @@ endfunction()
 
 # The headers of the test framework take longer to read than most tests: where files are compiled in
 # batches, they are read once for all tests. The tests' own code is compiled without optimisation
-# there, which halves its time; what is tested keeps it.
+# there, which halves its time, and with it what stands in the headers that it includes.
 function(test_code name)
   target_link_libraries(${name} PRIVATE project_options GTest::gtest GTest::gmock)
   if(NOT CLIPHOST_BATCHES)
