@@ -23,7 +23,8 @@ void AppendGiven(const CLI::App& app, const CLI::App& other, std::vector<std::st
         }
         const bool takesValue = option->get_items_expected_max() > 0;
         for (const std::string& value : option->results()) {
-            given.push_back(takesValue ? name + "=" + value : name);
+            const bool isPlainFlag = !takesValue && value == "true";
+            given.push_back(isPlainFlag ? name : name + "=" + value);
         }
     }
 }
@@ -47,7 +48,7 @@ void AddWorkerOptions(CLI::App& verb, WorkerCall& call) {
         ->group(group);
     verb.add_option("--limit-memory", call.limits.mebibytes,
                     "Give a movie up whose process needs more MiB of memory, the program's own "
-                    "included; the same holds")
+                    "included; movies are then read by such processes, whatever --jobs is")
         ->check(WholeNumber(kLeastMebibytes, kMostMebibytes))
         ->group(group);
 }
