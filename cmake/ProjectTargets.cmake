@@ -52,19 +52,22 @@ function(define_paths source)
   set_property(SOURCE ${source} APPEND PROPERTY COMPILE_DEFINITIONS ${ARGN})
 endfunction()
 
-# project_library(NAME SOURCES file... [PUBLIC target...] [PRIVATE target...])
-# One static library for one folder, linked into the module, the host or tests.
+# project_library(NAME [SINGLE] SOURCES file... [PUBLIC target...] [PRIVATE target...])
+# One static library for one folder, linked into the module, the host or tests. SINGLE: never
+# compiled in batches, because a test has doubles of some of its files.
 function(project_library name)
-  cmake_parse_arguments(ARG "" "" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
+  cmake_parse_arguments(ARG "SINGLE" "" "SOURCES;PUBLIC;PRIVATE" ${ARGN})
   add_library(${name} STATIC ${ARG_SOURCES})
-  set_target_properties(${name} PROPERTIES UNITY_BUILD ${CLIPHOST_BATCHES})
+  if(CLIPHOST_BATCHES AND NOT ARG_SINGLE)
+    set_target_properties(${name} PROPERTIES UNITY_BUILD ON)
+  endif()
   target_link_libraries(${name} PUBLIC project_options host_interfaces ${ARG_PUBLIC}
                                 PRIVATE ${ARG_PRIVATE})
 endfunction()
 
 # The headers of the test framework take longer to read than most tests: where files are compiled in
 # batches, they are read once for all tests. The tests' own code is compiled without optimisation
-# there, which halves its time; what is tested keeps it.
+# there, which halves its time, and with it what stands in the headers that it includes.
 function(test_code name)
   target_link_libraries(${name} PRIVATE project_options GTest::gtest GTest::gmock)
   if(NOT CLIPHOST_BATCHES)

@@ -47,9 +47,10 @@ std::wstring FromUtf16(const std::uint8_t* bytes, std::size_t size) {
         unit = static_cast<wchar_t>(bytes[0] | bytes[1] << 8);
         bytes += 2;
     }
-    return IsAscii(text) ? text
-                         : encodings::ToWideLossy(
-                               encodings::FromUtf16(std::u16string(text.begin(), text.end())));
+    if (IsAscii(text)) {
+        return text;
+    }
+    return encodings::ToWideLossy(encodings::FromUtf16(std::u16string(text.begin(), text.end())));
 }
 
 Bytes StoredText(const std::wstring& text) {

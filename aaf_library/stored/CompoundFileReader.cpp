@@ -12,10 +12,6 @@ namespace {
 
 constexpr std::size_t kLongestNameBytes = 2 * (kLongestName + 1);  // with the terminator
 
-std::uint32_t NumberIn(const std::uint8_t* bytes) {
-    return ByteReader(bytes, 4).TakeNumber<std::uint32_t>();
-}
-
 CompoundFileReader::Entry ParseEntry(const std::uint8_t* bytes) {
     CompoundFileReader::Entry entry;
     ByteReader from(bytes, kDirectoryEntrySize);

@@ -26,10 +26,6 @@ void CheckName(const std::u16string& name) {
     }
 }
 
-std::uint32_t NumberIn(const std::uint8_t* at) {
-    return at[0] | at[1] << 8 | at[2] << 16 | std::uint32_t{at[3]} << 24;
-}
-
 Bytes NumberBytes(const std::vector<std::uint32_t>& numbers) {
     Bytes bytes(numbers.size() * 4);
     std::uint8_t* at = bytes.data();
@@ -178,6 +174,17 @@ std::uint8_t* CompoundFileWriter::EntryAt(std::uint32_t index) {
     return directory_.data() + index * kDirectoryEntrySize;
 }
 
+std::u16string CompoundFileWriter::NameOf(std::uint32_t index) {
+    const std::uint8_t* const entry = EntryAt(index);
+    ByteReader size(entry + kEntryNameSizeOffset, 2);
+    std::u16string name(size.TakeNumber<std::uint16_t>() / 2 - 1, u'\0');
+    ByteReader units(entry, 2 * name.size());
+    for (char16_t& unit : name) {
+        unit = units.TakeNumber<std::uint16_t>();
+    }
+    return name;
+}
+
 void CompoundFileWriter::SetContent(std::uint32_t index, std::uint32_t start, std::size_t size) {
     PutNumber(EntryAt(index) + kEntryStartOffset, start);
     PutNumber(EntryAt(index) + kEntrySizeOffset, std::uint64_t{size});
@@ -201,7 +208,7 @@ void CompoundFileWriter::LinkSiblings() {
         const Place& before = places_[i - 1];
         const bool first = i == 1 || before.holder != place.holder;
         if (!first && order(before) == order(place)) {
-            throw StoredError("\"" + ToUtf8({place.name.data(), place.length}) +
+            throw StoredError("\"" + ToUtf8(NameOf(std::max(before.index, place.index))) +
                               "\" is twice in one storage");
         }
         PutNumber(first ? EntryAt(place.holder) + kEntryChildOffset

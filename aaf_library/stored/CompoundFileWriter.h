@@ -55,6 +55,7 @@ private:
 
     std::uint32_t AddEntry(Storage holder, const std::u16string& name, EntryKind kind);
     std::uint8_t* EntryAt(std::uint32_t index);
+    std::u16string NameOf(std::uint32_t index);
     void SetContent(std::uint32_t index, std::uint32_t start, std::size_t size);
     void SetHeader(std::size_t offset, std::size_t value);
     std::uint32_t AppendSectors(const Bytes& content);

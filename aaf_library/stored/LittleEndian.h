@@ -18,6 +18,11 @@ void PutNumber(std::uint8_t* at, Number value) {
     }
 }
 
+// Four bytes as a number.
+inline std::uint32_t NumberIn(const std::uint8_t* at) {
+    return at[0] | at[1] << 8 | at[2] << 16 | std::uint32_t{at[3]} << 24;
+}
+
 // Appends numbers to bytes, little-endian and without padding.
 class ByteWriter {
 public:

@@ -17,7 +17,8 @@ namespace aaf::stored {
 // it is made of, so that no definition refers to one that is missing.
 class MetaClosure {
 public:
-    // What is as built in leads to nothing else: whoever knows it, too, may do without.
+    // LeftOut: a definition that says what the built-in model says is not gathered, nor are
+    // those that it needs, which are built in as well.
     enum class BuiltIn { Gathered, LeftOut };
 
     explicit MetaClosure(Model& model, BuiltIn builtIn = BuiltIn::Gathered)

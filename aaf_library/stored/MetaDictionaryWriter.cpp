@@ -12,6 +12,7 @@
 #include <deque>
 #include <memory>
 #include <mutex>
+#include <optional>
 
 namespace aaf::stored {
 
@@ -251,33 +252,58 @@ StoredObject MetaDictionaryOf(const MetaRecords& records,
     return dictionary;
 }
 
+// Movies of one kind need the same definitions, so the dictionaries that were used last
+// are kept as a whole.
+class KeptDictionaries {
+public:
+    std::optional<StoredObject> Find(const MetaRecords& records) {
+        const std::lock_guard<std::mutex> lock(mutex_);
+        const auto known = std::find_if(kept_.begin(), kept_.end(),
+                                        [&](const Kept& one) { return one.records == records; });
+        if (known == kept_.end()) {
+            return std::nullopt;
+        }
+        std::rotate(kept_.begin(), known, known + 1);
+        return kept_.front().dictionary;
+    }
+
+    void Keep(const MetaRecords& records, const StoredObject& dictionary) {
+        const std::lock_guard<std::mutex> lock(mutex_);
+        kept_.push_front({records, dictionary});
+        kept_.resize(std::min(kept_.size(), kMost));
+    }
+
+private:
+    struct Kept {
+        MetaRecords records;
+        StoredObject dictionary;
+    };
+
+    static constexpr std::size_t kMost = 8;
+    std::mutex mutex_;
+    std::deque<Kept> kept_;
+};
+
 }  // namespace
 
 StoredObject StoredMetaDictionary(const MetaRecords& records) {
     return MetaDictionaryOf(records, StoredBuiltInClass, StoredBuiltInType);
 }
 
-// Movies of one kind need the same definitions, so the last few dictionaries are kept.
 StoredObject LaidOutMetaDictionary(const MetaRecords& records) {
-    struct Known {
-        MetaRecords records;
-        StoredObject dictionary;
-    };
-    constexpr std::size_t most = 8;
-    static std::mutex mutex;
-    static std::deque<Known> lastOnes;
-    const std::lock_guard<std::mutex> lock(mutex);
-    const auto known = std::find_if(lastOnes.begin(), lastOnes.end(),
-                                    [&](const Known& one) { return one.records == records; });
-    if (known != lastOnes.end()) {
-        return known->dictionary;
+    static KeptDictionaries kept;
+    if (std::optional<StoredObject> known = kept.Find(records)) {
+        return *std::move(known);
     }
     StoredObject dictionary = MetaDictionaryOf(records, LaidOutClass, LaidOutType);
-    if (auto laidOut = LayOut(dictionary, {kClassPath, kTypePath})) {
-        dictionary.properties.clear();
-        dictionary.laidOut = std::move(laidOut);
-        lastOnes.push_front({records, dictionary});
-        lastOnes.resize(std::min(lastOnes.size(), most));
+    try {
+        if (auto laidOut = LayOut(dictionary, {kClassPath, kTypePath})) {
+            dictionary.properties.clear();
+            dictionary.laidOut = std::move(laidOut);
+            kept.Keep(records, dictionary);
+        }
+    } catch (const StoredError&) {
+        // The writer of the whole file will find the same, and tells where it is.
     }
     return dictionary;
 }

@@ -35,7 +35,8 @@ struct MetaClass {
 struct MetaRecords {
     std::vector<MetaClass> classes;
     std::vector<TypeFacts> types;
-    // Those that say nothing else than the built-in model, where somebody cares.
+    // Those that say what the built-in model says. MetaClosure alone tells them apart; of a file
+    // that was read all are above.
     std::vector<const BuiltInClass*> builtInClasses;
     std::vector<const BuiltInType*> builtInTypes;
 };

@@ -18,7 +18,8 @@ namespace aaf::stored {
 // stored empty. Throws StoredError when an object lacks one that it must hold,
 // such as a slot its segment.
 StoredObject TreeOfModel(Model& model, Object& header);
-// The same for writing alone: of a built-in definition there is what WriteTree needs.
+// The same for WriteTree alone: definitions that files have in common are there as they are laid
+// out, not as properties.
 StoredObject TreeToWrite(Model& model, Object& header);
 
 }  // namespace aaf::stored

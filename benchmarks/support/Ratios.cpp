@@ -69,6 +69,7 @@ Verdict Judge(const Goal& goal, const Measured& ours, const Measured& peer) {
     const double rate = ours.itemsASecond > 0 ? ours.itemsASecond : 1 / ours.seconds;
     switch (goal.of) {
         case Goal::Of::TimeRatio:
+        case Goal::Of::Growth:
             return {Text("%.3g", times), Text("at most %g", goal.bound), times <= goal.bound};
         case Goal::Of::RateRatio:
             return {Text("%.3g", 1 / times), Text("at least %g", goal.bound),
@@ -90,12 +91,18 @@ void PrintRow(const std::string& work, const Pair& pair, const Measured& ours,
     const bool isHeld = pair.from == 0 || (place != std::string::npos &&
                                            std::atoll(work.c_str() + place + 1) >= pair.from);
     const Verdict verdict = Judge(isHeld ? pair.goal : NoGoal, ours, peer ? *peer : Measured{1, 0});
-    std::printf("| %s | %s | %s | %s | %s | %s | %s |\n", work.c_str(), pair.peer.c_str(),
+    const std::string name = pair.goal.of == Goal::Of::Growth ? "half of it" : pair.peer;
+    std::printf("| %s | %s | %s | %s | %s | %s | %s |\n", work.c_str(), name.c_str(),
                 peer ? Duration(peer->seconds).c_str() : "", Duration(ours.seconds).c_str(),
                 verdict.ratio.c_str(), verdict.wanted.c_str(),
                 verdict.wanted.empty() ? ""
                 : verdict.isMet        ? "met"
                                        : "MISSED");
+}
+
+// The only argument of a benchmark that grows, halved.
+std::string HalfOf(const std::string& arguments) {
+    return std::to_string(std::atoll(arguments.c_str()) / 2);
 }
 
 }  // namespace
@@ -109,11 +116,12 @@ int RunWithRatios(int argc, char** argv, const std::vector<Pair>& pairs) {
     KeepingReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
     for (const Pair& pair : pairs) {
+        const bool isGrowth = pair.goal.of == Goal::Of::Growth;
         for (const auto& [arguments, runs] : reporter.kept[pair.ours]) {
             const std::string work = arguments.empty() ? pair.ours : pair.ours + " " + arguments;
-            const auto& peers = reporter.kept[pair.peer];
-            const auto peer = peers.find(arguments);
-            if (pair.peer.empty()) {
+            const auto& peers = reporter.kept[isGrowth ? pair.ours : pair.peer];
+            const auto peer = peers.find(isGrowth ? HalfOf(arguments) : arguments);
+            if (pair.peer.empty() && !isGrowth) {
                 PrintRow(work, pair, Median(runs), nullptr);
             } else if (peer != peers.end()) {
                 const Measured median = Median(peer->second);

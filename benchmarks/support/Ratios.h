@@ -13,6 +13,7 @@ struct Goal {
         RateRatio,  // our rate divided by the peer's: at least
         Time,       // of one run, in seconds: at most
         Rate,       // runs or items a second: at least
+        Growth,     // our time divided by our own at half the argument: at most
     };
     Of of = Of::Nothing;
     double bound = 0;
@@ -31,9 +32,12 @@ constexpr Goal SecondsAtMost(double seconds) {
 constexpr Goal ASecondAtLeast(double count) {
     return {Goal::Of::Rate, count};
 }
+constexpr Goal GrowthAtMost(double ratio) {
+    return {Goal::Of::Growth, ratio};
+}
 
 // Two benchmarks of one program that do the same work: `ours` beside `peer`, each with every
-// argument that both have. Without a peer, ours alone is held to the goal.
+// argument that both have. Without a peer, ours alone is held to the goal, its growth to itself.
 struct Pair {
     std::string ours;
     std::string peer;

@@ -106,7 +106,7 @@ void AafLibrary::SaveToDevice(IAAFFile* file, const std::filesystem::path& devic
     std::error_code error;
     const host::system::ScratchFolder scratch(error);
     if (error) {
-        throw Failure(kExitCaller, std::filesystem::temp_directory_path(),
+        throw Failure(kExitCaller, host::system::TemporaryFolder(),
                       "no folder can be made there: " + error.message(),
                       "name another one in TMPDIR");
     }

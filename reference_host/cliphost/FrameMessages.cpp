@@ -72,6 +72,7 @@ std::string FrameAnswer::ToBytes() const {
 }
 
 bool FrameAnswer::Read(std::string_view bytes, const FrameRequest& request) {
+    *this = {};
     FieldReader fields(bytes);
     const bool isOutcome = FromBytes(fields.Text(), {}, outcome);
     plan.count = fields.Number();

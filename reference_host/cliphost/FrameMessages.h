@@ -30,7 +30,7 @@ struct FrameAnswer {
     int height = 0;
 
     std::string ToBytes() const;
-    // False for what can't answer the request.
+    // False for what can't answer the request. Nothing of what was read before is left.
     bool Read(std::string_view bytes, const FrameRequest& request);
 };
 

@@ -10,7 +10,7 @@
 #include "reference_host/cliphost/FrameMessages.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/PrivateFile.h"
-#include "reference_host/framework/HostPath.h"
+#include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
 namespace {
@@ -54,7 +54,6 @@ public:
     }
 
 private:
-    void Begin(std::size_t) override {}
     bool Read(std::size_t, const std::string& answer) override {
         return answer_.Read(answer, request_);
     }
@@ -81,7 +80,6 @@ public:
 private:
     FramePlan Plan() override { return PlanCall(options(), wanted()).Run(); }
     void WriteAll(const FramePlan& plan) override;
-    void Begin(std::size_t) override {}
     bool Read(std::size_t number, const std::string& answer) override {
         return answers_[number].Read(answer, requests_[number]);
     }
@@ -113,7 +111,7 @@ std::filesystem::path RunInPieces::FolderNearOutput() const {
     const std::filesystem::path& output = options().output;
     std::error_code ignored;
     if (OutputFile::IsDevice(output)) {
-        return std::filesystem::temp_directory_path();
+        return host::system::TemporaryFolder();
     }
     const std::filesystem::path place = std::filesystem::absolute(output, ignored);
     return std::filesystem::is_directory(place, ignored) ? place : place.parent_path();

@@ -6,6 +6,7 @@
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
+#include "reference_host/system/FileNumber.h"
 
 namespace cliphost {
 namespace {
@@ -14,12 +15,14 @@ namespace {
 constexpr std::uint64_t kManyFramesFrom = 24;
 
 // What comes through a pipe is wanted as it is read, and a piece is whole at its end alone. Raw
-// frames are hardly more than decoded, and most decoders have threads of their own.
+// frames are hardly more than decoded, and most decoders have threads of their own. A descriptor
+// is that of this process.
 bool IsForWorkers(const FrameOptions& options, const WantedFrames& wanted, bool areJobsGiven) {
     const WorkerCall& call = options.workers;
     const std::uint64_t most = wanted.range.CountIn(std::numeric_limits<std::uint64_t>::max());
     return call.limits.AreSet() ||
            (call.jobs > 1 && most >= kManyFramesFrom && !OutputFile::IsDevice(options.output) &&
+            !host::system::NamesDescriptor(options.movie) &&
             (areJobsGiven || !IsRawFile(options.output)));
 }
 

@@ -11,7 +11,7 @@
 namespace cliphost {
 namespace {
 
-constexpr std::size_t kDeepest = 1024;  // objects and lists in one another
+constexpr std::size_t kMostOpen = 1024;  // objects and lists in one another
 
 // The characters of ASCII that stand in JSON for themselves.
 constexpr auto kPlain = [] {
@@ -75,7 +75,7 @@ private:
             if (first == '"') {
                 return TakeText();
             }
-            if ((first != '{' && first != '[') || open.size() == kDeepest) {
+            if ((first != '{' && first != '[') || open.size() == kMostOpen) {
                 return false;
             }
             ++at_;

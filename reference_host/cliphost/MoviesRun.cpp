@@ -12,6 +12,8 @@
 #include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/OutputStream.h"
+#include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
 
@@ -39,8 +41,12 @@ int MoviesRun::Run() {
     Plan();
     const auto movies = std::count_if(steps_.begin(), steps_.end(),
                                       [](const MovieStep& step) { return step.IsMovie(); });
+    // A descriptor is that of this process.
+    const bool isOurs = std::any_of(steps_.begin(), steps_.end(), [](const MovieStep& step) {
+        return host::system::NamesDescriptor(step.movie);
+    });
     const bool isForWorkers =
-        options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1);
+        options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
     if (isForWorkers) {
         RunInChildren();
     } else {
@@ -113,6 +119,18 @@ void MoviesRun::RunHere() {
     progress_.reset();
 }
 
+// Where the file will be, so that it need not be copied there.
+std::filesystem::path MoviesRun::PlaceToWrite() const {
+    if (!options_.outFolder.empty()) {
+        return options_.outFolder;
+    }
+    if (host::system::IsStandardOutput(options_.file) || OutputFile::IsDevice(options_.file)) {
+        return host::system::TemporaryFolder();
+    }
+    const std::filesystem::path folder = options_.file.parent_path();
+    return folder.empty() ? "." : folder;
+}
+
 void MoviesRun::RunInChildren() {
     std::vector<std::string> requests;
     for (std::size_t i = 0; i < steps_.size(); ++i) {
@@ -124,8 +142,7 @@ void MoviesRun::RunInChildren() {
     }
     WorkerCall call = options_.workers;
     if (options_.Saves()) {
-        call.writeNear = options_.outFolder.empty() ? std::filesystem::temp_directory_path()
-                                                    : options_.outFolder;
+        call.writeNear = PlaceToWrite();
     }
     progress_.emplace(doing_, requests.size());
     RunInWorkers(call, requests, *this);
@@ -139,11 +156,6 @@ void MoviesRun::TellThoseBefore(std::size_t place) {
     }
 }
 
-void MoviesRun::Begin(std::size_t number) {
-    progress_->Step(
-        DisplayPath(std::filesystem::path(steps_[placesOfRequests_[number]].movie).filename()));
-}
-
 bool MoviesRun::Read(std::size_t number, const std::string& answer) {
     return ReadAnswer(answer, answers_[number]);
 }
@@ -152,6 +164,7 @@ void MoviesRun::Take(std::size_t number, const WorkerResult& result) {
     const std::size_t place = placesOfRequests_[number];
     TellThoseBefore(place);
     ++nextPlace_;
+    progress_->Step(DisplayPath(std::filesystem::path(steps_[place].movie).filename()));
     Notice("{}", result.told);
     GoOnAfterFailure(steps_[place].movie, [&] { Deliver(steps_[place], number, result); });
     answers_.erase(number);
@@ -195,6 +208,18 @@ void MoviesRun::Settle(const std::filesystem::path& movie, const MovieAnswer& an
     Show(movie, answer, saved);
 }
 
+// The paths of the command line by the files that they name.
+const MoviesRun::PathsByFile& MoviesRun::Given() {
+    if (given_.empty()) {
+        for (const std::filesystem::path& path : options_.paths) {
+            if (const auto number = host::system::NumberOf(path)) {
+                given_.emplace(*number, &path);
+            }
+        }
+    }
+    return given_;
+}
+
 std::filesystem::path MoviesRun::TargetFor(const std::filesystem::path& movie) {
     std::filesystem::path target = options_.file;
     // Movies of one name in different folders get numbers.
@@ -206,13 +231,12 @@ std::filesystem::path MoviesRun::TargetFor(const std::filesystem::path& movie) {
             target = free;
         }
     }
-    std::error_code ignored;
-    if (!std::filesystem::exists(target, ignored)) {
-        return target;  // so it is no movie
-    }
-    RefuseOutputOntoMovie(target, movie);
-    for (const std::filesystem::path& other : options_.paths) {
-        RefuseOutputOntoMovie(target, other);
+    const auto inItsPlace = host::system::NumberOf(target);
+    if (inItsPlace) {
+        RefuseOutputOntoMovie(target, movie);
+        if (const auto other = Given().find(*inItsPlace); other != Given().end()) {
+            RefuseOutputOntoMovie(target, *other->second);
+        }
     }
     return target;
 }

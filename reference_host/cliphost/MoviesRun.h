@@ -14,6 +14,7 @@
 #include "reference_host/cliphost/MovieAnswer.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/Workers.h"
+#include "reference_host/system/FileNumber.h"
 
 namespace cliphost {
 
@@ -68,9 +69,9 @@ private:
     void Refuse(const std::filesystem::path& path, int status, const Problem& problem);
     void RunHere();
     void RunInChildren();
+    std::filesystem::path PlaceToWrite() const;
     void TellInstead(const MovieStep& step);
     void TellThoseBefore(std::size_t place);
-    void Begin(std::size_t number) override;
     bool Read(std::size_t number, const std::string& answer) override;
     void Take(std::size_t number, const WorkerResult& result) override;
     void Deliver(const MovieStep& step, std::size_t number, const WorkerResult& result);
@@ -79,6 +80,8 @@ private:
     // Does one movie; what it fails with is told, and the next one goes on.
     template <class Work>
     void GoOnAfterFailure(const std::filesystem::path& movie, const Work& work);
+    using PathsByFile = std::map<host::system::FileNumber, const std::filesystem::path*>;
+    const PathsByFile& Given();
     std::filesystem::path TargetFor(const std::filesystem::path& movie);
 
     Session& session_;
@@ -91,6 +94,7 @@ private:
     std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
     std::optional<Progress> progress_;
     std::set<std::filesystem::path> targetsTaken_;
+    PathsByFile given_;
     int done_ = 0;
     int failed_ = 0;
     int status_ = kExitFine;  // the highest of all failures

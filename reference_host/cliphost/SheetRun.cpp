@@ -40,7 +40,6 @@ std::unique_ptr<SheetPictures> PicturesFor(Essence& essence, const ClipTrack& tr
 
 MovieAnswer MakeSheet(Session& session, const std::filesystem::path& movie, const SheetForm& form,
                       const PlaceOfFile& place) {
-    const std::filesystem::path file = place();
     Essence essence = OpenEssence(session, movie, form.parameters);
     const ClipTrack& track = essence.Track(std::nullopt, TrackKind::Picture);
     const auto pictures = PicturesFor(essence, track, form);
@@ -78,7 +77,7 @@ MovieAnswer MakeSheet(Session& session, const std::filesystem::path& movie, cons
     if (failed == frames.size()) {
         throw Failure(kExitFile, movie, "no frame could be read, so there is no sheet");
     }
-    WriteWholeFile(file, ToPng(sheet.picture()));
+    WriteWholeFile(place(), ToPng(sheet.picture()));
     MovieAnswer answer;
     answer.description =
         fmt::format("{} of {}", frames.size() - failed, Counted(pictures->Count(), "frame"));

@@ -23,7 +23,8 @@ void AppendGiven(const CLI::App& app, const CLI::App& other, std::vector<std::st
         }
         const bool takesValue = option->get_items_expected_max() > 0;
         for (const std::string& value : option->results()) {
-            given.push_back(takesValue ? name + "=" + value : name);
+            const bool isPlainFlag = !takesValue && value == "true";
+            given.push_back(isPlainFlag ? name : name + "=" + value);
         }
     }
 }
@@ -36,8 +37,8 @@ const WorkerWords kManyMovies = {
     "one does to its process costs that movie alone. With 1, and for a single movie, this process "
     "reads",
     "Give a movie up that takes longer; movies are then read by such processes, whatever --jobs is",
-    "Give a movie up whose process needs more MiB of memory, the program's own included; the same "
-    "holds"};
+    "Give a movie up whose process needs more MiB of memory, the program's own included; movies "
+    "are then read by such processes, whatever --jobs is"};
 
 const WorkerWords kManyFrames = {
     "Many frames at once",
@@ -46,8 +47,9 @@ const WorkerWords kManyFrames = {
     "output is a pipe or a device, and for raw frames unless this is given, this process reads",
     "Give a piece of the range up that takes longer; frames are then read by such processes, "
     "whatever --jobs and the output are",
-    "Give a piece up whose process needs more MiB of memory, the program's own included; the same "
-    "holds"};
+    "Give a piece up whose process needs more MiB of memory, the program's own included; frames "
+    "are "
+    "then read by such processes, whatever --jobs and the output are"};
 
 void AddWorkerOptions(CLI::App& verb, WorkerCall& call, const WorkerWords& words) {
     call.jobs = host::system::UsableProcessors();

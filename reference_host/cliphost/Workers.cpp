@@ -10,6 +10,7 @@
 #include <map>
 #include <memory>
 #include <optional>
+#include <set>
 #include <thread>
 
 #include "reference_host/cliphost/Failure.h"
@@ -32,6 +33,7 @@ constexpr std::size_t kMostTold = std::size_t{16} << 20;
 // What lies ready for a process is to last so long, and is no more than so many requests.
 constexpr Clock::duration kTimeAhead = std::chrono::milliseconds(10);
 constexpr int kMostAhead = 32;
+constexpr auto kLongestWait = std::chrono::milliseconds(200);
 constexpr char kNoAnswer[] = "the process that read it gave an answer that is none";
 constexpr std::size_t kMebibyte = std::size_t{1} << 20;
 
@@ -41,6 +43,8 @@ struct Worker {
     MessageStream messages;
     std::string errors;
     bool isReady = false;
+    bool isGivenUp = false;            // it can't be started
+    std::size_t answered = 0;          // since its process was started
     std::deque<std::size_t> requests;  // the first is being worked on
     Clock::time_point since;
 };
@@ -85,6 +89,7 @@ private:
     void Listen(Worker& worker);
     void Hear(Worker& worker, const std::string& message);
     void HoldToLimits(Worker& worker);
+    void LeaveOut(Clock::duration time);
     // Ends the process; what it was at has failed, what it has not begun goes to another.
     void Lose(Worker& worker, const std::string& why);
     void Settle(Worker& worker, const std::string& failure);
@@ -99,7 +104,10 @@ private:
     std::deque<std::size_t> again_;
     std::map<std::size_t, WorkerResult> waiting_;
     std::size_t taken_ = 0;
-    Clock::duration usualTime_{0};  // of the last requests
+    Clock::time_point heard_ = Clock::now();
+    // Of the last requests. Until there were some, nothing is handed out ahead.
+    Clock::duration usualTime_ = kTimeAhead;
+    std::set<std::size_t> retried_;
 };
 
 void Run::MakeScratchFolder() {
@@ -113,7 +121,7 @@ void Run::MakeScratchFolder() {
         scratch_.emplace(error);
     }
     if (error) {
-        throw Failure(kExitCaller, std::filesystem::temp_directory_path(),
+        throw Failure(kExitCaller, host::system::TemporaryFolder(),
                       "no folder can be made there: " + error.message(),
                       "name another one in TMPDIR");
     }
@@ -122,7 +130,11 @@ void Run::MakeScratchFolder() {
 void Run::GoOn() {
     while (taken_ < requests_.size()) {
         HandOut();
+        const Clock::time_point idle = Clock::now();
+        LeaveOut(idle - heard_);
         Wait();
+        heard_ = Clock::now();
+        LeaveOut(heard_ - idle - kLongestWait);
         if (host::system::DelayedSignals::HaveCome()) {
             return;  // it may have ended the processes, too
         }
@@ -142,12 +154,19 @@ void Run::HandOut() {
     for (std::size_t depth = 1, most = RequestsAhead(); depth <= most; ++depth) {
         for (std::size_t i = 0; i < workers_.size(); ++i) {
             Worker& worker = *workers_[i];
-            if (worker.requests.size() >= depth) {
+            if (worker.isGivenUp || worker.requests.size() >= depth) {
                 continue;
             }
             const std::optional<std::size_t> request = NextRequest();
             if (!request) {
                 return;
+            }
+            if (worker.answered > 0 && retried_.count(*request) > 0) {
+                if (!worker.requests.empty()) {
+                    again_.push_front(*request);
+                    continue;
+                }
+                worker.process.End();  // what others left there is not to count again
             }
             if (!worker.process.IsRunning() && !Start(worker)) {
                 again_.push_front(*request);
@@ -166,7 +185,7 @@ std::size_t Run::RequestsAhead() const {
         return 1;  // what each needs is measured
     }
     const auto inTime = kTimeAhead / std::max<Clock::duration>(usualTime_, kTimeAhead / kMostAhead);
-    return std::max<std::size_t>(2, static_cast<std::size_t>(inTime));
+    return std::max<std::size_t>(1, static_cast<std::size_t>(inTime));
 }
 
 bool Run::AllHaveEnough() const {
@@ -195,7 +214,6 @@ std::optional<std::size_t> Run::NextRequest() {
     if (next_ == requests_.size() || next_ - taken_ >= call_.mostWaiting) {
         return std::nullopt;
     }
-    client_.Begin(next_);
     return next_++;
 }
 
@@ -203,14 +221,16 @@ bool Run::Start(Worker& worker) {
     worker.messages = {};
     worker.errors.clear();
     worker.isReady = false;
+    worker.answered = 0;
     std::vector<std::string> arguments = call_.arguments;
+    std::error_code folderError;
     if (scratch_) {
         worker.folder = scratch_->path() / fmt::format("{}", foldersMade_++);
-        std::error_code error;
-        std::filesystem::create_directory(worker.folder, error);
+        std::filesystem::create_directory(worker.folder, folderError);
         arguments.push_back("--folder=" + worker.folder.native());
     }
-    const int error = worker.process.Start(call_.program, arguments);
+    const int error =
+        folderError ? folderError.value() : worker.process.Start(call_.program, arguments);
     if (error != 0 && workers_.size() == 1) {
         throw Failure(
             kExitCaller, call_.program,
@@ -233,14 +253,16 @@ void Run::Wait() {
         }
     }
     host::system::ChildProcess::WaitForAny(
-        running, std::chrono::milliseconds(call_.limits.AreSet() ? 20 : 200));
+        running, call_.limits.AreSet() ? std::chrono::milliseconds(20) : kLongestWait);
 }
 
 void Run::Listen(Worker& worker) {
     if (!worker.process.IsRunning()) {
         return;
     }
+    worker.process.SendRest();
     const bool isOpen = worker.process.Receive(worker.messages.arrived());
+    const bool isBehind = worker.process.HasMore();
     worker.process.ReceiveErrors(worker.errors, kMostTold);
     while (std::optional<std::string> message = worker.messages.Next()) {
         Hear(worker, *message);
@@ -252,7 +274,7 @@ void Run::Listen(Worker& worker) {
         Lose(worker, kNoAnswer);
     } else if (!isOpen) {
         Lose(worker, EndInWords(worker.process.End()));
-    } else {
+    } else if (!isBehind) {
         HoldToLimits(worker);
     }
 }
@@ -284,6 +306,7 @@ void Run::Hear(Worker& worker, const std::string& message) {
         Lose(worker, kNoAnswer);
         return;
     }
+    ++worker.answered;
     Settle(worker, "");
     // What it holds would be laid to the movies after this one.
     if (needed > most / 2) {
@@ -304,17 +327,30 @@ void Run::HoldToLimits(Worker& worker) {
     }
 }
 
+// Time in which nobody listened is not theirs.
+void Run::LeaveOut(Clock::duration time) {
+    for (const auto& worker : workers_) {
+        worker->since += std::max(time, Clock::duration::zero());
+    }
+}
+
 void Run::Lose(Worker& worker, const std::string& why) {
     worker.process.End();
     if (!worker.isReady) {
-        Notice("{}", TakeTold(worker));
-        throw Failure(kExitCaller, call_.program, "a process that reads movies did not start",
-                      "try --jobs 1");
-    }
-    if (worker.requests.empty()) {
+        worker.isGivenUp = true;
+        if (std::all_of(workers_.begin(), workers_.end(),
+                        [](const auto& one) { return one->isGivenUp; })) {
+            Notice("{}", TakeTold(worker));
+            throw Failure(kExitCaller, call_.program, "a process that reads movies did not start",
+                          "try --jobs 1");
+        }
+    } else if (worker.requests.empty()) {
         return;
+    } else if (worker.answered > 0 && retried_.insert(worker.requests.front()).second) {
+        TakeTold(worker);  // it may have come to harm by a movie before: a process of its own tells
+    } else {
+        Settle(worker, why);
     }
-    Settle(worker, why);
     again_.insert(again_.end(), worker.requests.begin(), worker.requests.end());
     worker.requests.clear();
 }

@@ -12,7 +12,8 @@
 namespace cliphost {
 
 // Many movies at once: child processes of this program read one after the other, each with
-// a host of its own. What a movie does to its process, it does to itself alone.
+// a host of its own. What a movie does to its process, it does to itself alone: a request whose
+// process ends after others were answered there is tried once more, in a process of its own.
 
 struct WorkerLimits {
     unsigned seconds = 0;    // for one movie; 0: none
@@ -46,8 +47,6 @@ struct WorkerResult {
 class WorkerClient {
 public:
     virtual ~WorkerClient() = default;
-    // The request is handed to a process.
-    virtual void Begin(std::size_t number) = 0;
     // Keeps an answer, which may be anything: the process has met the movie. False for what is
     // none; the process then ends. Answers come in any order.
     virtual bool Read(std::size_t number, const std::string& answer) = 0;

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cmath>
 #include <numeric>
+
 #include "reference_host/header_parser/NumberLimits.h"
 
 namespace header_parser {

@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <limits>
+
 #include "reference_host/header_parser/NumberLimits.h"
 
 namespace header_parser {

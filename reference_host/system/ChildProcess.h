@@ -33,10 +33,14 @@ public:
     int Start(const std::filesystem::path& program, const std::vector<std::string>& arguments);
     bool IsRunning() const { return process_ > 0; }
 
+    // Neither waits: what finds no room in the channel is kept, and sent with the rest.
     // False when the child takes nothing more.
     bool Send(const std::string& bytes);
+    bool SendRest();
     // Appends what has arrived, without waiting. False once the child has closed its end.
     bool Receive(std::string& bytes);
+    // Whether the last call of Receive may have left something.
+    bool HasMore() const { return hasMore_; }
     // The same of its standard error, up to a length of the text; what comes then is lost.
     void ReceiveErrors(std::string& text, std::size_t most);
     // The most memory that it held resident so far; 0 where the system can't tell.
@@ -45,8 +49,8 @@ public:
     // Ends it if it still runs, and takes it off the system's list.
     ProcessEnd End();
 
-    // Sleeps until one of these has sent something or has ended, or until a time has
-    // passed or a signal came.
+    // Sleeps until one of these has sent something, has room for what is kept or has ended, or
+    // until a time has passed or a signal came.
     static void WaitForAny(const std::vector<const ChildProcess*>& children,
                            std::chrono::milliseconds most);
 
@@ -54,6 +58,8 @@ private:
     int process_ = 0;
     int channel_ = -1;
     int errors_ = -1;
+    std::string unsent_;
+    bool hasMore_ = false;
 };
 
 // The other end, inside a child process.

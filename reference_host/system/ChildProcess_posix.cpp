@@ -63,9 +63,11 @@ private:
     posix_spawn_file_actions_t actions_;
 };
 
+constexpr std::size_t kPiece = 65536;
+
 // Reads what is there; false at the end. The descriptor does not wait.
 bool ReadSome(int descriptor, std::string& bytes) {
-    char piece[65536];
+    char piece[kPiece];
     for (;;) {
         const ssize_t got = read(descriptor, piece, sizeof piece);
         if (got > 0) {
@@ -126,19 +128,30 @@ int ChildProcess::Start(const std::filesystem::path& program,
 }
 
 bool ChildProcess::Send(const std::string& bytes) {
-    for (std::size_t sent = 0; sent < bytes.size();) {
-        const ssize_t now = send(channel_, bytes.data() + sent, bytes.size() - sent, MSG_NOSIGNAL);
+    unsent_ += bytes;
+    return SendRest();
+}
+
+bool ChildProcess::SendRest() {
+    while (!unsent_.empty()) {
+        const ssize_t now = send(channel_, unsent_.data(), unsent_.size(), MSG_NOSIGNAL);
         if (now >= 0) {
-            sent += static_cast<std::size_t>(now);
+            unsent_.erase(0, static_cast<std::size_t>(now));
+        } else if (errno == EAGAIN) {
+            return true;
         } else if (errno != EINTR) {
-            return false;  // what we send is short: a child that leaves no room does not read
+            unsent_.clear();
+            return false;
         }
     }
     return true;
 }
 
 bool ChildProcess::Receive(std::string& bytes) {
-    return ReadSome(channel_, bytes);
+    const std::size_t before = bytes.size();
+    const bool isOpen = ReadSome(channel_, bytes);
+    hasMore_ = isOpen && bytes.size() - before >= kPiece;
+    return isOpen;
 }
 
 void ChildProcess::ReceiveErrors(std::string& text, std::size_t most) {
@@ -176,6 +189,8 @@ ProcessEnd ChildProcess::End() {
         end.status = WIFEXITED(status) ? WEXITSTATUS(status) : 0;
     }
     process_ = 0;
+    unsent_.clear();
+    hasMore_ = false;
     CloseIfOpen(channel_);
     CloseIfOpen(errors_);
     return end;
@@ -185,7 +200,8 @@ void ChildProcess::WaitForAny(const std::vector<const ChildProcess*>& children,
                               std::chrono::milliseconds most) {
     std::vector<pollfd> ends;
     for (const ChildProcess* const child : children) {
-        ends.push_back({child->channel_, POLLIN, 0});
+        const int room = child->unsent_.empty() ? 0 : POLLOUT;
+        ends.push_back({child->channel_, static_cast<short>(POLLIN | room), 0});
         ends.push_back({child->errors_, POLLIN, 0});
     }
     poll(ends.data(), ends.size(), static_cast<int>(most.count()));

@@ -15,7 +15,7 @@ extern "C" void NoteSignal(int signal) {
 
 DelayedSignals::DelayedSignals() {
     noted = 0;
-    for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE}) {
         Before before{signal, {}};
         if (sigaction(signal, nullptr, &before.action) != 0 ||
             before.action.sa_handler == SIG_IGN) {

@@ -7,6 +7,9 @@
 
 namespace host::system {
 
+// Where temporary files go. There may be no such folder.
+std::filesystem::path TemporaryFolder();
+
 // A folder of our own among the temporary files or in another folder, gone with what is
 // in it.
 class ScratchFolder {

@@ -7,8 +7,12 @@
 
 namespace host::system {
 
-ScratchFolder::ScratchFolder(std::error_code& error)
-    : ScratchFolder(std::filesystem::temp_directory_path(), error) {}
+std::filesystem::path TemporaryFolder() {
+    const char* const named = std::getenv("TMPDIR");
+    return named != nullptr && *named != '\0' ? named : "/tmp";
+}
+
+ScratchFolder::ScratchFolder(std::error_code& error) : ScratchFolder(TemporaryFolder(), error) {}
 
 ScratchFolder::ScratchFolder(const std::filesystem::path& parent, std::error_code& error) {
     std::string name = parent / "cliphost-XXXXXX";

@@ -11,8 +11,10 @@
 
 #include <chrono>
 #include <cstdlib>
+#include <fstream>
 #include <map>
 #include <nlohmann/json.hpp>
+#include <sstream>
 #include <thread>
 
 #include "tests/system/Command.h"
@@ -126,6 +128,14 @@ TEST_F(EqualJobs, PrintTheSame) {
     }
 }
 
+TEST_F(EqualJobs, TakeFlagsThatAreTurnedOff) {
+    const std::string call =
+        "describe --use-alpha=false --quiet=false" + std::string(kPinned) + Few();
+    ExpectTheSame(call, {" --jobs 2"});
+    EXPECT_GT(Print(call + " --jobs 2").out.size(), 1000u) << "not quiet";
+    ExpectTheSame("describe --json=false" + std::string(kPinned) + Few(), {" --jobs 2"});
+}
+
 TEST_F(EqualJobs, SaveTheSame) {
     std::set<std::string> names;
     std::string printed;
@@ -231,6 +241,51 @@ TEST_F(Jobs, SaveOneMovieWhereverItIsWanted) {
     EXPECT_EQ(ReadFile(folder() / "piped.aaf"), ReadFile(folder() / "here.aaf"));
 }
 
+TEST_F(Jobs, SaveOneMovieWithoutAFolderForTemporaryFiles) {
+    const std::string movie = Quoted(MadeMovie("png.mov"));
+    const CommandResult ran =
+        RunCommand("TMPDIR=/no/such/folder " + Program() + " describe -q " + movie + " --aaf " +
+                   In("here.aaf") + " --limit-seconds 100 2>&1");
+    EXPECT_EQ(ran.status, 0) << ran.out;
+    EXPECT_EQ(NamesIn(folder()), (std::set<std::string>{"here.aaf", "in", "tmp"}));
+    const CommandResult piped = RunCommand("TMPDIR=/no/such/folder " + Program() + " describe -q " +
+                                           movie + " --aaf - --limit-seconds 100 2>&1 >/dev/null");
+    ExpectSays(piped, 2, "/no/such/folder: no folder can be made there");
+}
+
+TEST_F(Jobs, LeaveDescriptorsToTheProcessThatHasThem) {
+    Copy("b.mov");
+    const CommandResult ran = RunCommand(Program() + " describe -q --jobs 2 /dev/stdin " +
+                                         In("in/b.mov") + " 2>&1 <" + Quoted(MadeMovie("png.mov")));
+    ExpectSays(ran, 0, "2 described, 0 not");
+}
+
+TEST_F(Jobs, LeaveNoFolderBehindAReaderThatWentAway) {
+    for (const char* const name : {"a.mov", "b.mov", "c.mov"}) {
+        Copy(name);
+        Write(movies::Bytes(100, 'x'), std::string("in/bad-") + name);
+    }
+    RunCommand("env --default-signal=PIPE " + Program() + " describe " + In("in") + " --out-dir " +
+               In("out") + " --jobs 2 2>&1 | true");
+    for (const std::string& name : NamesIn(folder() / "out")) {
+        EXPECT_EQ(std::filesystem::path(name).extension(), ".aaf") << name;
+    }
+}
+
+TEST_F(Jobs, NameSheetsAlikeBehindAMovieThatGivesNone) {
+    for (const char* const place : {"a", "b"}) {
+        std::filesystem::create_directories(folder() / "in" / place);
+    }
+    Write(movies::Bytes(100, 'x'), "in/a/clip.mov");
+    Copy("b/clip.mov");
+    for (const char* const jobs : {"1", "2"}) {
+        RunCliphost("contact " + In("in/a/clip.mov") + " " + In("in/b/clip.mov") + " --jobs " +
+                    jobs + " --out-dir " + In("out"));
+        EXPECT_EQ(NamesIn(folder() / "out"), (std::set<std::string>{"clip.png"})) << jobs;
+        std::filesystem::remove_all(folder() / "out");
+    }
+}
+
 TEST_F(Jobs, TellWhatCantBeWrittenByTheUsersName) {
     Copy("a.mov");
     Copy("b.mov");
@@ -334,12 +389,9 @@ TEST_F(Jobs, WriteNothingButTheirOwnFolder) {
 std::set<std::string> ProcessesOf(const std::string& words) {
     std::set<std::string> found;
     for (const auto& entry : std::filesystem::directory_iterator("/proc")) {
-        std::error_code ignored;
-        if (!std::filesystem::exists(entry.path() / "cmdline", ignored)) {
-            continue;
-        }
-        const movies::Bytes line = ReadFile(entry.path() / "cmdline");
-        if (std::string(line.begin(), line.end()).find(words) != std::string::npos) {
+        std::ostringstream line;  // stays empty for a process that ends meanwhile
+        line << std::ifstream(entry.path() / "cmdline").rdbuf();
+        if (line.str().find(words) != std::string::npos) {
             found.insert(entry.path().filename());
         }
     }

@@ -63,6 +63,8 @@ TEST(FrameMessages, ComeBackAsTheyWere) {
     EXPECT_EQ(read.plan.cuts, (std::vector<std::uint64_t>{5, 9}));
     EXPECT_EQ(read.width, 64);
     EXPECT_EQ(read.height, 48);
+    ASSERT_TRUE(read.Read(answer.ToBytes(), Request(Kind::Plan, 0, {})));
+    EXPECT_EQ(read.plan.cuts, (std::vector<std::uint64_t>{5, 9}));
 }
 
 TEST(FrameMessages, ArePlansOfWhatWasAskedForAlone) {

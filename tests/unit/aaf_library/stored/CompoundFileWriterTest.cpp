@@ -292,8 +292,8 @@ TEST(CompoundFileWriter, RefusesNamesThatNoEntryCanHold) {
 }
 
 TEST(CompoundFileWriter, RefusesANameTwiceInOneStorage) {
-    EXPECT_EQ(Refusal(u"name", u"name"), "\"NAME\" is twice in one storage");
-    EXPECT_EQ(Refusal(u"name", u"Name"), "\"NAME\" is twice in one storage");
+    EXPECT_EQ(Refusal(u"name", u"name"), "\"name\" is twice in one storage");
+    EXPECT_EQ(Refusal(u"name", u"Name"), "\"Name\" is twice in one storage");
     CompoundFileWriter writer(SectorSize::Bytes512);
     writer.AddStream(writer.AddStorage(kRoot, u"name"), u"name", {});
     EXPECT_NO_THROW(writer.Finish());
@@ -307,7 +307,8 @@ TEST(UpperCase, FollowsTheSimpleMappings) {
         {u'\u00FF', u'\u0178'}, {u'\u0101', u'\u0100'}, {u'\u0102', u'\u0102'},
         {u'\u0131', u'I'},      {u'\u03C2', u'\u03A3'}, {u'\u044F', u'\u042F'},
         {u'\u4E2D', u'\u4E2D'}, {u'\uFF5A', u'\uFF3A'}, {u'\uFF5B', u'\uFF5B'},
-        {0xD83C, 0xD83C},       {0xFFFF, 0xFFFF}};
+        {u'\u1F80', u'\u1F88'}, {u'\u1FB3', u'\u1FBC'}, {0xD83C, 0xD83C},
+        {0xFFFF, 0xFFFF}};
     for (const auto& [small, capital] : pairs) {
         EXPECT_EQ(UpperCase(small), capital) << std::hex << static_cast<int>(small);
     }

@@ -23,8 +23,10 @@
 
 #include <gtest/gtest.h>
 #include <algorithm>
+#include <atomic>
 #include <functional>
 #include <set>
+#include <thread>
 
 using namespace aaf;
 using namespace aaf::stored;
@@ -149,6 +151,71 @@ TEST(ModelFile, ABuiltInDefinitionThatACallerChangedIsSavedAsItIs) {
             dynamic_cast<TypeExtendibleEnumeration&>(*model.FindType(kAAFTypeID_UsageType));
         type.AppendElement(ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E78"), L"Usage_More");
     });
+}
+
+// A usage of its own makes the definitions of a file those of no other.
+sample::SampleModel ModelWithUsage(std::uint8_t number) {
+    sample::SampleModel sample = sample::WholeModel();
+    GUID id = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E80");
+    id.Data4[7] = number;
+    auto& type =
+        dynamic_cast<TypeExtendibleEnumeration&>(*sample.model->FindType(kAAFTypeID_UsageType));
+    type.AppendElement(id, (L"Usage_" + std::to_wstring(number)).c_str());
+    return sample;
+}
+
+TEST(ModelFile, MoreKindsOfDefinitionsThanAreKeptGiveTheSameBytes) {
+    for (int turn = 0; turn < 2; ++turn) {
+        for (std::uint8_t number = 0; number < 10; ++number) {
+            const sample::SampleModel sample = ModelWithUsage(number);
+            const Bytes saved = BytesToSave(sample);
+            EXPECT_EQ(saved, BytesOf(sample)) << turn << ' ' << int{number};
+            EXPECT_EQ(BytesToSave(ModelWithUsage(0)), BytesOf(ModelWithUsage(0)));
+        }
+    }
+}
+
+TEST(ModelFile, SeveralThreadsSaveAtOnce) {
+    std::vector<Bytes> wanted;
+    for (std::uint8_t number = 0; number < 3; ++number) {
+        wanted.push_back(BytesOf(ModelWithUsage(number)));
+    }
+    std::vector<std::thread> threads;
+    std::atomic<int> wrong{0};
+    for (int i = 0; i < 4; ++i) {
+        threads.emplace_back([&, i] {
+            for (int turn = 0; turn < 6; ++turn) {
+                const auto number = static_cast<std::uint8_t>((i + turn) % 3);
+                wrong += BytesToSave(ModelWithUsage(number)) != wanted[number] ? 1 : 0;
+            }
+        });
+    }
+    for (std::thread& thread : threads) {
+        thread.join();
+    }
+    EXPECT_EQ(wrong, 0);
+}
+
+TEST(ModelFile, ADefinitionThatIsTooLongIsToldWithItsPlace) {
+    const sample::SampleModel sample = sample::WholeModel();
+    auto& type =
+        dynamic_cast<TypeExtendibleEnumeration&>(*sample.model->FindType(kAAFTypeID_UsageType));
+    GUID id = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E80");
+    for (int i = 0; i < 1200; ++i) {
+        id.Data1 = static_cast<std::uint32_t>(i);
+        type.AppendElement(id, (L"Usage_of_quite_a_long_name_" + std::to_wstring(i)).c_str());
+    }
+    const auto refusal = [&](const auto& save) -> std::string {
+        try {
+            save(sample);
+        } catch (const StoredError& error) {
+            return error.what();
+        }
+        return "";
+    };
+    const std::string whole = refusal([](const auto& model) { BytesOf(model); });
+    EXPECT_EQ(whole.find("MetaDictionary-1: TypeDefinitions-4{"), 0u) << whole;
+    EXPECT_EQ(refusal([](const auto& model) { BytesToSave(model); }), whole);
 }
 
 TEST(ModelFile, EverythingComesBackFromTheFile) {
