@@ -80,8 +80,9 @@ private:
     void MakeScratchFolder();
     void HandOut();
     void HandTo(Worker& worker, std::size_t request);
-    // False where the system has room for no more of them.
-    bool Start(Worker& worker);
+    // Gives 0, or the system's error number.
+    int Start(Worker& worker);
+    void GiveUp(Worker& worker, const std::string& why);
     std::optional<std::size_t> NextRequest();
     std::size_t RequestsAhead() const;
     bool AllHaveEnough() const;
@@ -152,8 +153,8 @@ void Run::GoOn() {
 
 void Run::HandOut() {
     for (std::size_t depth = 1, most = RequestsAhead(); depth <= most; ++depth) {
-        for (std::size_t i = 0; i < workers_.size(); ++i) {
-            Worker& worker = *workers_[i];
+        for (const auto& held : workers_) {
+            Worker& worker = *held;
             if (worker.isGivenUp || worker.requests.size() >= depth) {
                 continue;
             }
@@ -168,10 +169,11 @@ void Run::HandOut() {
                 }
                 worker.process.End();  // what others left there is not to count again
             }
-            if (!worker.process.IsRunning() && !Start(worker)) {
+            if (const int error = worker.process.IsRunning() ? 0 : Start(worker)) {
                 again_.push_front(*request);
-                workers_.erase(workers_.begin() + static_cast<std::ptrdiff_t>(i));
-                return;  // the others have to do
+                GiveUp(worker, "no further process can be started: " +
+                                   std::generic_category().message(error));
+                return;
             }
             HandTo(worker, *request);
         }
@@ -217,7 +219,7 @@ std::optional<std::size_t> Run::NextRequest() {
     return next_++;
 }
 
-bool Run::Start(Worker& worker) {
+int Run::Start(Worker& worker) {
     worker.messages = {};
     worker.errors.clear();
     worker.isReady = false;
@@ -229,15 +231,16 @@ bool Run::Start(Worker& worker) {
         std::filesystem::create_directory(worker.folder, folderError);
         arguments.push_back("--folder=" + worker.folder.native());
     }
-    const int error =
-        folderError ? folderError.value() : worker.process.Start(call_.program, arguments);
-    if (error != 0 && workers_.size() == 1) {
-        throw Failure(
-            kExitCaller, call_.program,
-            "no further process can be started: " + std::generic_category().message(error),
-            "try --jobs 1");
+    return folderError ? folderError.value() : worker.process.Start(call_.program, arguments);
+}
+
+// The others have to do.
+void Run::GiveUp(Worker& worker, const std::string& why) {
+    worker.isGivenUp = true;
+    if (std::all_of(workers_.begin(), workers_.end(),
+                    [](const auto& one) { return one->isGivenUp; })) {
+        throw Failure(kExitCaller, call_.program, why, "try --jobs 1");
     }
-    return error == 0;
 }
 
 void Run::Wait() {
@@ -337,13 +340,8 @@ void Run::LeaveOut(Clock::duration time) {
 void Run::Lose(Worker& worker, const std::string& why) {
     worker.process.End();
     if (!worker.isReady) {
-        worker.isGivenUp = true;
-        if (std::all_of(workers_.begin(), workers_.end(),
-                        [](const auto& one) { return one->isGivenUp; })) {
-            Notice("{}", TakeTold(worker));
-            throw Failure(kExitCaller, call_.program, "a process that reads movies did not start",
-                          "try --jobs 1");
-        }
+        Notice("{}", TakeTold(worker));
+        GiveUp(worker, "a process that reads movies did not start");
     } else if (worker.requests.empty()) {
         return;
     } else if (worker.answered > 0 && retried_.insert(worker.requests.front()).second) {

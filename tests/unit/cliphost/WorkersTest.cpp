@@ -228,6 +228,23 @@ TEST(Workers, AreAsManyAsTheSystemHasRoomFor) {
     EXPECT_EQ(client.answers.size(), 100u);
 }
 
+TEST(Workers, FailWhereTheLastCanNotBeStartedAnew) {
+    // Of two the first alone serves, once, and takes the program away.
+    const std::filesystem::path folder =
+        std::filesystem::path(testing::TempDir()) / ("last-" + std::to_string(getpid()));
+    std::filesystem::create_directory(folder);
+    WorkerCall call;
+    call.program = folder / "sh";
+    std::filesystem::copy_file("/bin/sh", call.program);
+    call.arguments = {"-c", "mkdir '" + (folder / "first").string() + "' 2>/dev/null || exit 1\n" +
+                                Ready() + Request() + "rm '" + call.program.string() + "'\n" +
+                                Answer("fine")};
+    call.jobs = 2;
+    Client client;
+    EXPECT_THROW(RunInWorkers(call, std::vector<std::string>(4, "x"), client), Failure);
+    std::filesystem::remove_all(folder);
+}
+
 TEST(Workers, HaveNothingToDoWithoutRequests) {
     EXPECT_TRUE(RunShells("exit 1", 0).taken.empty());
 }
