@@ -237,8 +237,8 @@ TEST(Workers, FailWhereTheLastCanNotBeStartedAnew) {
     call.program = folder / "sh";
     std::filesystem::copy_file("/bin/sh", call.program);
     call.arguments = {"-c", "mkdir '" + (folder / "first").string() + "' 2>/dev/null || exit 1\n" +
-                                Ready() + Request() + "rm '" + call.program.string() + "'\n" +
-                                Answer("fine")};
+                                Ready() + Request() + "sleep 0.3; rm '" + call.program.string() +
+                                "'\n" + Answer("fine")};
     call.jobs = 2;
     Client client;
     EXPECT_THROW(RunInWorkers(call, std::vector<std::string>(4, "x"), client), Failure);
