@@ -445,6 +445,20 @@ TEST(ModelFile, ADefinitionThatTheDictionaryLacksIsRefused) {
               "a definition that is referred to is not in the dictionary (property 2605)");
 }
 
+TEST(ModelFile, ABuiltInDefinitionThatNobodyLookedUpIsStoredWhereItIsReferredTo) {
+    const sample::SampleModel sample = sample::WholeModel();
+    Object& import = sample::mob(*sample.header, 1);
+    Object* timecode = sample::slot(import, 0).ObjectAt(prop::MobSlot_Segment);
+    Bytes& target = timecode->FindValue(prop::Component_DataDefinition)->BytesToChange();
+    const StoredAuid edgecode = AuidOf(kAAFDataDef_Edgecode);
+    target.assign(edgecode.begin(), edgecode.end());
+    EXPECT_EQ(refusal(sample), "");
+    const StoredObject tree = TreeOfModel(*sample.model, *sample.header);
+    const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
+    const std::vector<Bytes>& keys = dictionary.Find(prop::Dictionary_DataDefinitions.pid)->keys;
+    EXPECT_EQ(std::count(keys.begin(), keys.end(), target), 1);
+}
+
 TEST(ModelFile, AFileKeepsWhatItSaysOfABuiltInDefinition) {
     const sample::SampleModel sample = sample::WholeModel();
     auto* picture =
