@@ -7,6 +7,7 @@
 #include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
@@ -139,10 +140,10 @@ void DescribeRun::Finish(int described, int failed) {
             AddEntry(head, "");
         }
     }
-    for (const std::string& rule : maps_.Unused()) {
-        if (described > 0) {
-            TellAlso(Failure(kExitCaller, "--map " + rule, "nothing was mapped by it",
-                             "give FROM as the locators of `cliphost describe` begin"));
+    if (described > 0) {
+        for (const Failure& unused :
+             UnusedMaps(maps_, "give FROM as the locators of `cliphost describe` begin")) {
+            TellAlso(unused);
         }
     }
     if (!options_.form.json) {

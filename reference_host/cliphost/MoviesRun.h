@@ -59,7 +59,10 @@ protected:
     virtual void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
                       const std::filesystem::path& saved) = 0;
     virtual void ShowFailure(const std::filesystem::path&, const Problem&) {}
+    // Whether a failure is told on standard error, too.
+    virtual bool TellsFailures() const { return true; }
     // What is made of all takes the file that a child process has made of one.
+    virtual bool Collects() const { return !options_.together.empty(); }
     virtual void Collect(const std::filesystem::path& /*movie*/,
                          const std::filesystem::path& /*file*/) {}
     // After all.

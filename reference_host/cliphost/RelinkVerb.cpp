@@ -1,0 +1,46 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include "reference_host/cliphost/CheckOptions.h"
+#include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/Relink.h"
+#include "reference_host/cliphost/Verbs.h"
+#include "reference_host/system/OutputStream.h"
+
+namespace cliphost {
+
+void AddRelink(CLI::App& app, const SessionOptions& session, int& status) {
+    auto* const verb = app.add_subcommand(
+        "relink",
+        "Find moved movies by their content and write an AAF file anew with their places");
+    verb->footer(
+        "Example: cliphost relink bin.aaf --search /mnt/new -o relinked.aaf\n"
+        "What else is in the file stays as it is, other makers' clips too.\n"
+        "Exit status: 0, every clip that can be matched by content leads to its movie; 1, some "
+        "don't, or the AAF file can't be read;\n2, the call is at fault.");
+    auto options = std::make_shared<RelinkOptions>();
+    auto pinned = std::make_shared<std::string>();
+    verb->add_option("file", options->file, "The AAF file")->required();
+    verb->add_option("-o,--output", options->output,
+                     "Write the file here, which may be the same file; - for standard output")
+        ->required();
+    verb->add_flag("--json", options->json, kJsonHelp);
+    verb->add_option("--pin-time", *pinned,
+                     "Time stamp of what is written, such as 2026-01-31T12:00:00Z");
+    AddCheckOptions(*verb, options->check)->required();
+    verb->callback([&app, &session, &status, options, pinned] {
+        AnswerFailureToo(options->json, {{"aaf", MachinePath(options->file)}}, [&] {
+            if (options->json && host::system::IsStandardOutput(options->output)) {
+                throw Failure(kExitCaller, "-o", "standard output takes the JSON", "name a file");
+            }
+            TakeDescribingWorkers(app, session, options->check.workers);
+            SessionOptions withTime = session;
+            withTime.pinTime = *pinned;
+            Session running(withTime);
+            status = Relink(running, *options);
+        });
+    });
+}
+
+}  // namespace cliphost
