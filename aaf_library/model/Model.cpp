@@ -297,6 +297,9 @@ PropertyId Model::EnterProperty(PropertyDefinition& property) {
 }
 
 void Model::ForgetProperty(PropertyDefinition& property) {
+    if (dying_) {
+        return;
+    }
     const auto found = propertyById_.find(property.id());
     if (found != propertyById_.end() && found->second == &property) {
         propertyById_.erase(found);

@@ -48,8 +48,12 @@ bool IsWeak(StoredForm form) {
 }
 
 void SortByPid(StoredObject& object) {
-    std::sort(object.properties.begin(), object.properties.end(),
-              [](const StoredProperty& a, const StoredProperty& b) { return a.pid < b.pid; });
+    const auto isBefore = [](const StoredProperty& a, const StoredProperty& b) {
+        return a.pid < b.pid;
+    };
+    if (!std::is_sorted(object.properties.begin(), object.properties.end(), isBefore)) {
+        std::sort(object.properties.begin(), object.properties.end(), isBefore);
+    }
 }
 
 class ModelWriter {
@@ -322,18 +326,13 @@ private:
 
     static std::vector<const PropertyDefinition*> RequiredObjects(ClassDefinition& definition) {
         std::vector<const PropertyDefinition*> out;
-        for (ClassDefinition* at = &definition; at != nullptr; at = at->parent()) {
-            for (const RefPtr<PropertyDefinition>& property : at->properties()) {
-                const bool wanted = !property->IsOptional() ||
-                                    property->id() == prop::ContentStorage_EssenceData.id;
-                if (!wanted || property->type() == nullptr) {
-                    continue;
-                }
-                const StoredForm form = StoredFormOf(*property->type());
-                if (form == StoredForm::StrongReference || form == StoredForm::StrongVector ||
-                    form == StoredForm::StrongSet) {
-                    out.push_back(property.get());
-                }
+        for (const PropertyDefinition* property :
+             definition.RequiredProperties(prop::ContentStorage_EssenceData.id)) {
+            const TypeDefinition* const type = property->type();
+            const StoredForm form = type == nullptr ? StoredForm::Data : StoredFormOf(*type);
+            if (form == StoredForm::StrongReference || form == StoredForm::StrongVector ||
+                form == StoredForm::StrongSet) {
+                out.push_back(property);
             }
         }
         return out;
