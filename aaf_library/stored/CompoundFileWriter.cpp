@@ -42,10 +42,12 @@ std::size_t CountOf(std::size_t size, std::size_t part) {
 
 // The entries of a run that begins behind the last one.
 void AppendRun(std::vector<std::uint32_t>& table, std::size_t count) {
-    for (std::size_t i = 1; i < count; ++i) {
-        table.push_back(static_cast<std::uint32_t>(table.size() + 1));
+    const std::size_t first = table.size();
+    table.resize(first + std::max<std::size_t>(count, 1));
+    for (std::size_t at = first; at < table.size(); ++at) {
+        table[at] = static_cast<std::uint32_t>(at + 1);
     }
-    table.push_back(kEndOfChain);
+    table.back() = kEndOfChain;
 }
 
 void FillUp(std::vector<std::uint32_t>& numbers, std::size_t perSector) {
@@ -118,8 +120,10 @@ void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
         moveBy(entry + kEntryStartOffset, sectorsBefore);
     }
     small_.insert(small_.end(), part.small.begin(), part.small.end());
-    for (std::uint32_t next : part.smallTable) {
-        smallTable_.push_back(next > kLastPlainSector ? next : next + sectorsBefore);
+    smallTable_.insert(smallTable_.end(), part.smallTable.begin(), part.smallTable.end());
+    for (std::size_t at = sectorsBefore; at < smallTable_.size(); ++at) {
+        std::uint32_t& next = smallTable_[at];
+        next = next > kLastPlainSector ? next : next + sectorsBefore;
     }
 }
 

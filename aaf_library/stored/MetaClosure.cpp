@@ -21,6 +21,7 @@ MetaClass RecordOf(ClassDefinition& definition) {
     record.name = definition.name();
     record.parent = definition.parent() == nullptr ? record.id : definition.parent()->id();
     record.concrete = definition.concrete();
+    record.properties.reserve(definition.properties().size());
     for (const RefPtr<PropertyDefinition>& property : definition.properties()) {
         MetaProperty entry;
         entry.id = property->id();
@@ -29,7 +30,7 @@ MetaClass RecordOf(ClassDefinition& definition) {
         entry.type = property->typeId();
         entry.optional = property->IsOptional();
         entry.unique = property->IsUnique();
-        record.properties.push_back(entry);
+        record.properties.push_back(std::move(entry));
     }
     return record;
 }
@@ -42,8 +43,7 @@ bool IsNew(const Entry* entry, Span<Entry> table, std::vector<bool>& metEntries,
         return metIds.insert(id).second;
     }
     metEntries.resize(table.size());
-    std::vector<bool>::reference met =
-        metEntries[static_cast<std::size_t>(entry - table.begin())];
+    std::vector<bool>::reference met = metEntries[static_cast<std::size_t>(entry - table.begin())];
     const bool isNew = !met;
     met = true;
     return isNew;

@@ -94,7 +94,7 @@ private:
     };
     // What all objects of a class have in common.
     struct ClassFacts {
-        ClassDefinition* definition = nullptr;  // in the model that is written
+        ClassDefinition* definition = nullptr;  // as the model that is written has it
         StoredAuid id{};
         std::list<PropertyFacts> properties;  // those that were met
         std::vector<const PropertyDefinition*> required;
@@ -127,12 +127,26 @@ private:
         return out;
     }
 
+    // Whether a definition of any model tells what the model to be written would say: then nothing
+    // has to be made there.
+    static bool Says(const ClassDefinition& definition, const Model& model) {
+        if (definition.model() == &model) {
+            return true;
+        }
+        const ClassDefinition* at = &definition;
+        while (at != nullptr && at->IsAsBuiltIn()) {
+            at = at->parent();
+        }
+        return at == nullptr;
+    }
+
     ClassFacts& FactsOfClass(const Object& from) {
         const auto [place, isNew] = classes_.try_emplace(&from.classDefinition());
         ClassFacts& facts = place->second;
         if (isNew) {
-            facts.definition = from.model() == &model_ ? &from.classDefinition()
-                                                       : model_.ClassLike(from.classDefinition());
+            facts.definition = Says(from.classDefinition(), model_)
+                                   ? &from.classDefinition()
+                                   : model_.ClassLike(from.classDefinition());
             facts.id = AuidOf(from.classId());
             closure_.AddClass(from.classId());
             facts.required = RequiredObjects(*facts.definition);
@@ -147,8 +161,10 @@ private:
             }
         }
         const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
-        if (definition != nullptr && from.model() != &model_) {
-            definition = model_.PropertyLike(*facts.definition, *definition);
+        const bool isHere = facts.definition == &from.classDefinition() && pid < kFirstLocalPid;
+        if (definition != nullptr && from.model() != &model_ && !isHere) {
+            definition =
+                model_.PropertyLike(*model_.ClassLike(from.classDefinition()), *definition);
         }
         if (definition == nullptr || definition->type() == nullptr) {
             throw StoredError(PropertyText(pid) + " has no definition");
@@ -254,6 +270,7 @@ private:
 
     void AddTargets(StoredProperty& out, const PropertyFacts& facts, const PropertyValue& value) {
         const Bytes& ids = value.bytes();
+        out.keys.reserve(ids.size() / kIdSize);
         for (std::size_t at = 0; at + kIdSize <= ids.size(); at += kIdSize) {
             const auto from = ids.begin() + static_cast<std::ptrdiff_t>(at);
             out.keys.emplace_back(from, from + kIdSize);
