@@ -179,9 +179,14 @@ TEST_F(TargetOfACopy, KeepsAValueThatChanges) {
     ExpectThreeMobs(target_);
 }
 
-TEST_F(TargetOfACopy, LacksAnObjectThatJoinsAList) {
-    ExpectItKeepsWhatWasSavedWhen("slots", [&] { AddTrack(kAAFDataDef_LegacySound, 9); });
-    EXPECT_EQ(4u, Get(file_mob_, &IAAFMob::CountSlots));
+TEST_F(TargetOfACopy, LacksAnObjectThatJoinsASetAtItsEnd) {
+    Ptr<IAAFMob> late = FileMob(0xF1);
+    ExpectItKeepsWhatWasSavedWhen("mob",
+                                  [&] { EXPECT_EQ(AAFRESULT_SUCCESS, header_->AddMob(late)); });
+    ExpectThreeMobs(target_);
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(4u, count);
 }
 
 TEST_F(TargetOfACopy, KeepsAnObjectThatGoes) {
