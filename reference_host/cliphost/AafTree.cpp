@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <map>
+#include <string_view>
 #include <unordered_map>
 
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
@@ -16,7 +17,8 @@ namespace cliphost {
 namespace {
 
 constexpr int kDeepest = 32;  // objects inside objects
-constexpr std::size_t kUsualFacts = 12;
+constexpr std::size_t kUsualProperties = 16;
+constexpr std::string_view kClassOfObject = "ObjClass";
 
 // The names of definitions, each asked for once.
 template <class Definition>
@@ -39,61 +41,70 @@ private:
     std::unordered_map<Definition*, Named> names_;
 };
 
-// The order of properties is the library's affair; ours is by name.
-template <class Item>
-void InsertByName(Item item, std::vector<Item>& items) {
-    const auto place =
-        std::upper_bound(items.begin(), items.end(), item,
-                         [](const Item& a, const Item& b) { return a.name < b.name; });
-    items.insert(place, std::move(item));
-}
-
 class TreeReader {
 public:
-    TreeNode Read(IAAFObject* object, int depth);
+    void Read(IAAFObject* object, int depth, TreeNode& node);
 
 private:
-    void ReadProperty(IAAFProperty& property, int depth, TreeNode& node);
+    struct Property {
+        const std::string* name;
+        host::Ref<IAAFPropertyValue> value;
+    };
+    // The order of properties is the library's affair; ours is by name.
+    std::vector<Property> PropertiesByName(IAAFObject* object);
 
     ValueReader values_;
     Names<IAAFClassDef> classes_;
     Names<IAAFPropertyDef> properties_;
 };
 
-TreeNode TreeReader::Read(IAAFObject* object, int depth) {
-    TreeNode node;
+std::vector<TreeReader::Property> TreeReader::PropertiesByName(IAAFObject* object) {
+    std::vector<Property> found;
+    host::Ref<IEnumAAFProperties> properties;
+    if (object->GetProperties(properties.Out()) < 0) {
+        return found;
+    }
+    found.reserve(kUsualProperties);
+    host::Ref<IAAFProperty> property;
+    host::Ref<IAAFPropertyDef> definition;
+    host::Ref<IAAFPropertyValue> value;
+    while (properties->NextOne(property.Out()) >= 0) {
+        if (property->GetDefinition(definition.Out()) < 0 || property->GetValue(value.Out()) < 0) {
+            continue;
+        }
+        const std::string& name = properties_.Of(definition);
+        const auto place =
+            std::upper_bound(found.begin(), found.end(), name,
+                             [](const std::string& a, const Property& b) { return a < *b.name; });
+        found.insert(place, {&name, std::move(value)});
+    }
+    return found;
+}
+
+void TreeReader::Read(IAAFObject* object, int depth, TreeNode& node) {
     host::Ref<IAAFClassDef> definition;
     if (object->GetDefinition(definition.Out()) >= 0) {
         node.title = classes_.Of(definition);
     }
-    host::Ref<IEnumAAFProperties> properties;
-    if (depth > kDeepest || object->GetProperties(properties.Out()) < 0) {
-        return node;
-    }
-    node.facts.reserve(kUsualFacts);
-    host::Ref<IAAFProperty> property;
-    while (properties->NextOne(property.Out()) >= 0) {
-        ReadProperty(*property, depth, node);
-    }
-    return node;
-}
-
-void TreeReader::ReadProperty(IAAFProperty& property, int depth, TreeNode& node) {
-    host::Ref<IAAFPropertyDef> definition;
-    host::Ref<IAAFPropertyValue> value;
-    if (property.GetDefinition(definition.Out()) < 0 || property.GetValue(value.Out()) < 0) {
+    if (depth > kDeepest) {
         return;
     }
-    const std::string& name = properties_.Of(definition);
-    if (depth > 0 && name == "ObjClass") {
-        return;  // the title says it
-    }
-    std::vector<TreeNode> parts;
-    if (values_.TakeObjects(
-            value.get(), [&](IAAFObject* object) { parts.push_back(Read(object, depth + 1)); })) {
-        InsertByName(TreeNode::Branch{name, std::move(parts)}, node.branches);
-    } else if (name != "ObjClass") {
-        InsertByName(TreeNode::Fact{name, values_.Text(value.get())}, node.facts);
+    const std::vector<Property> properties = PropertiesByName(object);
+    node.facts.reserve(properties.size());
+    for (const Property& property : properties) {
+        const bool isClass = *property.name == kClassOfObject;  // the title says it
+        if (isClass && depth > 0) {
+            continue;
+        }
+        ValueType& type = values_.TypeOf(property.value.get());
+        std::vector<TreeNode> parts;
+        if (type.TakeObjects(property.value.get(), [&](IAAFObject* part) {
+                Read(part, depth + 1, parts.emplace_back());
+            })) {
+            node.branches.push_back({*property.name, std::move(parts)});
+        } else if (!isClass) {
+            node.facts.push_back({*property.name, type.Text(property.value.get())});
+        }
     }
 }
 
@@ -127,7 +138,7 @@ TreeNode ReadTree(IAAFFile* file) {
     TreeReader reader;
     for (const auto& each : mobs) {
         if (const auto object = As<IAAFObject>(each.get())) {
-            branch.nodes.push_back(reader.Read(object.get(), 0));
+            reader.Read(object.get(), 0, branch.nodes.emplace_back());
         }
     }
     root.branches.push_back(std::move(branch));
