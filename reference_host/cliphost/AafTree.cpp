@@ -4,9 +4,11 @@
 #include "reference_host/cliphost/AafTree.h"
 
 #include <algorithm>
+#include <functional>
 #include <map>
 #include <string_view>
 #include <unordered_map>
+#include <utility>
 
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "host_interfaces/aaf/AAFMobs.h"
@@ -17,7 +19,6 @@ namespace cliphost {
 namespace {
 
 constexpr int kDeepest = 32;  // objects inside objects
-constexpr std::size_t kUsualProperties = 16;
 constexpr std::string_view kClassOfObject = "ObjClass";
 
 // The names of definitions, each asked for once.
@@ -38,7 +39,8 @@ private:
         host::Ref<Definition> definition;  // so that no other comes to its place
         std::string name;
     };
-    std::unordered_map<Definition*, Named> names_;
+    // A movie's description has some sixty definitions.
+    std::unordered_map<Definition*, Named> names_{64};
 };
 
 class TreeReader {
@@ -50,21 +52,24 @@ private:
         const std::string* name;
         host::Ref<IAAFPropertyValue> value;
     };
-    // The order of properties is the library's affair; ours is by name.
-    std::vector<Property> PropertiesByName(IAAFObject* object);
+    // The order of properties is the library's affair; ours is by name. They come behind the open
+    // ones.
+    void OpenProperties(IAAFObject* object);
+    void ReadProperty(const Property& property, int depth, TreeNode& node);
 
     ValueReader values_;
     Names<IAAFClassDef> classes_;
     Names<IAAFPropertyDef> properties_;
+    // Of the object that is being read, behind those of the objects that it is part of.
+    std::vector<Property> open_;
 };
 
-std::vector<TreeReader::Property> TreeReader::PropertiesByName(IAAFObject* object) {
-    std::vector<Property> found;
+void TreeReader::OpenProperties(IAAFObject* object) {
     host::Ref<IEnumAAFProperties> properties;
     if (object->GetProperties(properties.Out()) < 0) {
-        return found;
+        return;
     }
-    found.reserve(kUsualProperties);
+    const auto first = static_cast<std::ptrdiff_t>(open_.size());
     host::Ref<IAAFProperty> property;
     host::Ref<IAAFPropertyDef> definition;
     host::Ref<IAAFPropertyValue> value;
@@ -74,11 +79,10 @@ std::vector<TreeReader::Property> TreeReader::PropertiesByName(IAAFObject* objec
         }
         const std::string& name = properties_.Of(definition);
         const auto place =
-            std::upper_bound(found.begin(), found.end(), name,
+            std::upper_bound(open_.begin() + first, open_.end(), name,
                              [](const std::string& a, const Property& b) { return a < *b.name; });
-        found.insert(place, {&name, std::move(value)});
+        open_.insert(place, {&name, std::move(value)});
     }
-    return found;
 }
 
 void TreeReader::Read(IAAFObject* object, int depth, TreeNode& node) {
@@ -89,22 +93,28 @@ void TreeReader::Read(IAAFObject* object, int depth, TreeNode& node) {
     if (depth > kDeepest) {
         return;
     }
-    const std::vector<Property> properties = PropertiesByName(object);
-    node.facts.reserve(properties.size());
-    for (const Property& property : properties) {
-        const bool isClass = *property.name == kClassOfObject;  // the title says it
-        if (isClass && depth > 0) {
-            continue;
-        }
-        ValueType& type = values_.TypeOf(property.value.get());
-        std::vector<TreeNode> parts;
-        if (type.TakeObjects(property.value.get(), [&](IAAFObject* part) {
-                Read(part, depth + 1, parts.emplace_back());
-            })) {
-            node.branches.push_back({*property.name, std::move(parts)});
-        } else if (!isClass) {
-            node.facts.push_back({*property.name, type.Text(property.value.get())});
-        }
+    const std::size_t first = open_.size();
+    OpenProperties(object);
+    const std::size_t end = open_.size();
+    node.facts.reserve(end - first);
+    for (std::size_t i = first; i < end; ++i) {
+        ReadProperty(std::exchange(open_[i], {}), depth, node);
+    }
+    open_.resize(first);
+}
+
+void TreeReader::ReadProperty(const Property& property, int depth, TreeNode& node) {
+    const bool isClass = *property.name == kClassOfObject;  // the title says it
+    if (isClass && depth > 0) {
+        return;
+    }
+    ValueType& type = values_.TypeOf(property.value.get());
+    std::vector<TreeNode> parts;
+    const auto read = [&](IAAFObject* part) { Read(part, depth + 1, parts.emplace_back()); };
+    if (type.TakeObjects(property.value.get(), std::ref(read))) {
+        node.branches.push_back({*property.name, std::move(parts)});
+    } else if (!isClass) {
+        node.facts.push_back({*property.name, type.Text(property.value.get())});
     }
 }
 

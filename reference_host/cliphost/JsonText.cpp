@@ -133,23 +133,23 @@ private:
 
 void AppendJsonText(std::string_view text, std::string& json) {
     const std::size_t before = json.size();
-    json += '"';
-    for (auto at = text.begin(); at != text.end();) {
-        const auto end = std::find_if_not(at, text.end(), IsPlain);
-        json.append(at, end);
-        at = end;
-        if (at != text.end()) {
-            if (*at != '"' && *at != '\\') {  // controls, and what may be no text at all
+    json.resize(before + 2 * text.size() + 2);  // were each character escaped
+    char* to = &json[before];
+    *to++ = '"';
+    for (const char c : text) {
+        if (!IsPlain(c)) {
+            if (c != '"' && c != '\\') {  // controls, and what may be no text at all
                 json.resize(before);
                 json += nlohmann::json(text).dump(-1, ' ', false,
                                                   nlohmann::json::error_handler_t::replace);
                 return;
             }
-            json += '\\';
-            json += *at++;
+            *to++ = '\\';
         }
+        *to++ = c;
     }
-    json += '"';
+    *to++ = '"';
+    json.resize(static_cast<std::size_t>(to - json.data()));
 }
 
 bool IsJsonOfTexts(std::string_view json) {
