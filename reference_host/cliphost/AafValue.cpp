@@ -175,7 +175,10 @@ public:
                               static_cast<aafUInt32>(count * sizeof(wchar_t))) < 0) {
             return kUnreadable;
         }
-        return '"' + Utf8(wide.data()) + '"';
+        std::string text = "\"";
+        text += Utf8(wide.data());
+        text += '"';
+        return text;
     }
 };
 
@@ -429,13 +432,16 @@ std::unique_ptr<ValueType> MakeType(ValueReader& reader, const host::Ref<IAAFTyp
 }  // namespace
 
 std::string Utf8(std::wstring_view wide) {
-    if (std::all_of(wide.begin(), wide.end(), [](wchar_t c) { return (c & ~0x7F) == 0; })) {
-        std::string text(wide.size(), '\0');
-        std::transform(wide.begin(), wide.end(), text.begin(),
-                       [](wchar_t c) { return static_cast<char>(c); });
-        return text;
+    std::string text(wide.size(), '\0');
+    bool isAscii = true;
+    for (std::size_t i = 0; i < wide.size(); ++i) {
+        text[i] = static_cast<char>(wide[i]);
+        isAscii = isAscii && (wide[i] & ~0x7F) == 0;
     }
-    return encodings::ToUtf8Lossy(encodings::FromWide(wide));
+    if (!isAscii) {
+        return encodings::ToUtf8Lossy(encodings::FromWide(wide));
+    }
+    return text;
 }
 
 namespace {

@@ -50,7 +50,7 @@ public:
     ValueType& TypeOf(IAAFPropertyValue* value);
 
 private:
-    std::unordered_map<IAAFTypeDef*, std::unique_ptr<ValueType>> types_;
+    std::unordered_map<IAAFTypeDef*, std::unique_ptr<ValueType>> types_{64};
 };
 
 }  // namespace cliphost
