@@ -82,14 +82,18 @@ function(test_code name)
   endif()
 endfunction()
 
-# test_program(NAME SOURCES file... LIBS target... [APART suite...] [FILTER pattern]
+# test_program(NAME [IN_BATCHES] SOURCES file... LIBS target... [APART suite...] [FILTER pattern]
 #              [PROPERTIES name value ...])
 # A GoogleTest program, each of whose suites is one of ctest's rows. Of suites that fit one of the
 # regular expressions of APART each test is a row, and so a process, of its own: what they change
-# in their process would be there for their neighbours.
+# in their process would be there for their neighbours. IN_BATCHES: compiled as the
+# libraries are, because no two of its files give one name to two things.
 function(test_program name)
-  cmake_parse_arguments(ARG "" "FILTER" "SOURCES;LIBS;APART;PROPERTIES" ${ARGN})
+  cmake_parse_arguments(ARG "IN_BATCHES" "FILTER" "SOURCES;LIBS;APART;PROPERTIES" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
+  if(CLIPHOST_BATCHES AND ARG_IN_BATCHES)
+    set_target_properties(${name} PROPERTIES UNITY_BUILD ON)
+  endif()
   test_code(${name})
   target_link_libraries(${name} PRIVATE ${ARG_LIBS} test_main)
   set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR}/tests)
@@ -109,7 +113,7 @@ include([==[${PROJECT_SOURCE_DIR}/cmake/TestRows.cmake]==])
   set_property(DIRECTORY APPEND PROPERTY TEST_INCLUDE_FILES ${base}_program.cmake)
 endfunction()
 
-# project_test(NAME SOURCES file... LIBS target... [APART suite...] [LABEL label])
+# project_test(NAME [IN_BATCHES] SOURCES file... LIBS target... [APART suite...] [LABEL label])
 # A program of unit tests.
 function(project_test name)
   cmake_parse_arguments(ARG "" "LABEL" "" ${ARGN})
