@@ -58,6 +58,7 @@ void DescribeRun::ShowFailure(const std::filesystem::path& movie, const Problem&
 
 void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& answer,
                        const std::filesystem::path& saved) {
+    maps_.AddUsed(answer.mapsUsed);
     if (host::system::IsStandardOutput(saved)) {
         return;
     }
@@ -81,6 +82,12 @@ void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& an
 }
 
 void DescribeRun::Finish(int described, int failed) {
+    for (const std::string& rule : maps_.Unused()) {
+        if (described > 0) {
+            TellAlso(Failure(kExitCaller, "--map " + rule, "nothing was mapped by it",
+                             "give FROM as the locators of `cliphost describe` begin"));
+        }
+    }
     if (!options_.form.json) {
         if (described + failed != 1 && !host::system::IsStandardOutput(options_.movies.file)) {
             fmt::print("{} described, {} not\n", described, failed);

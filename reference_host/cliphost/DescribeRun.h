@@ -15,7 +15,9 @@ struct DescribeOptions {
 class DescribeRun final : public MoviesRun {
 public:
     DescribeRun(Session& session, const DescribeOptions& options)
-        : MoviesRun(session, options.movies, "describing", ".aaf"), options_(options) {}
+        : MoviesRun(session, options.movies, "describing", ".aaf"),
+          options_(options),
+          maps_(options.form.maps) {}
 
 private:
     MovieAnswer Answer(const MovieStep& step, const PlaceOfFile& place) override;
@@ -26,6 +28,7 @@ private:
     void Finish(int described, int failed) override;
 
     const DescribeOptions& options_;
+    PathMaps maps_;                     // to know which were used
     std::vector<std::string> entries_;  // of the JSON list
 };
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/MovieAnswer.h"
 
+#include "reference_host/cliphost/AafLocators.h"
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Fields.h"
 #include "reference_host/cliphost/JsonText.h"
@@ -36,6 +37,9 @@ MovieAnswer AnswerOf(Session& session, const Description& description, const Des
     if (description.doubt) {
         TellProblem(description.doubt, session.verbosity());
     }
+    PathMaps maps = form.maps;
+    MapLocators(description.file.get(), maps);
+    answer.mapsUsed = maps.used();
     const std::filesystem::path saved = place();
     const bool isOnDisk = !saved.empty() && !OutputFile::IsDevice(saved);
     if (!saved.empty()) {
@@ -72,6 +76,7 @@ std::string ToBytes(const MovieAnswer& answer) {
         .Add(answer.route)
         .Add(answer.routeReason)
         .Add(answer.description)
+        .Add(answer.mapsUsed)
         .Add(std::uint64_t{answer.isPartial})
         .bytes();
 }
@@ -88,6 +93,7 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     answer.route = fields.Text();
     answer.routeReason = fields.Text();
     answer.description = fields.Text();
+    answer.mapsUsed = fields.Number();
     const std::uint64_t isPartial = fields.Number();
     answer.isPartial = isPartial != 0;
     if (!fields.IsWhole() || isPartial > 1 || status > kExitCaller || !IsRoute(answer.route) ||

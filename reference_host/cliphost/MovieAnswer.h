@@ -9,13 +9,15 @@
 
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/PathMaps.h"
 
 namespace cliphost {
 
-// How descriptions are shown.
+// How descriptions are shown and saved.
 struct DescriptionForm {
     bool json = false;
     bool quiet = false;
+    PathMaps maps;  // of the locators
 };
 
 // What a verb shows of one movie, whichever process read it.
@@ -25,15 +27,16 @@ struct MovieAnswer {
     std::string route;        // for JSON alone
     std::string routeReason;  // empty on the first route
     std::string description;  // text, or JSON indented as part of an entry; empty where not shown
-    bool isPartial = false;   // what was made is saved, though some of it could not be read
+    std::uint64_t mapsUsed = 0;  // as PathMaps counts them
+    bool isPartial = false;      // what was made is saved, though some of it could not be read
 };
 
 // Where what is made of a movie is to be saved, which may be nowhere. Asked once at most; throws a
 // Failure where that is the movie itself.
 using PlaceOfFile = std::function<std::filesystem::path()>;
 
-// Tells on standard error what is told of a movie that is described, saves the description
-// where `place` says, which may be nowhere, and reads it.
+// Tells on standard error what is told of a movie that is described, maps its locators, saves the
+// description where `place` says, which may be nowhere, and reads it.
 MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
                      const PlaceOfFile& place);
 

@@ -33,6 +33,11 @@ void MoviesRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work&
     }
 }
 
+void MoviesRun::TellAlso(const Failure& failure) {
+    status_ = std::max(status_, failure.status());
+    TellProblem(failure.problem(), session_.verbosity());
+}
+
 int MoviesRun::Run() {
     std::optional<OutputFolder> folder;
     if (!options_.outFolder.empty()) {

@@ -63,6 +63,8 @@ protected:
     virtual void Finish(int /*done*/, int /*failed*/) {}
 
     Session& session() { return session_; }
+    // Tells a problem that is not a movie's; it counts for the exit status.
+    void TellAlso(const Failure& failure);
 
 private:
     void Plan();

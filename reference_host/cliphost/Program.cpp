@@ -92,6 +92,7 @@ int Run(int argc, char** argv) {
     AddFrame(app, session, status);
     AddContact(app, session, status);
     AddAudio(app, session, status);
+    AddDump(app, session);
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);

@@ -79,13 +79,18 @@ std::string WithoutLineEnd(std::string text) {
 
 }  // namespace
 
-Session::Session(const SessionOptions& options) : verbosity_(options.verbosity) {
-    aaf_ = std::make_unique<AafLibrary>(
+std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options) {
+    auto library = std::make_unique<AafLibrary>(
         options.aafLibrary.empty() ? options.programFolder / kAAFLibraryName : options.aafLibrary);
-    if (!options.pinTime.empty() && !aaf_->PinTime(ParseTime(options.pinTime))) {
-        throw Failure(kExitCaller, aaf_->file(), "this AAF library can't pin its time stamps",
+    if (!options.pinTime.empty() && !library->PinTime(ParseTime(options.pinTime))) {
+        throw Failure(kExitCaller, library->file(), "this AAF library can't pin its time stamps",
                       "leave out --pin-time");
     }
+    return library;
+}
+
+Session::Session(const SessionOptions& options)
+    : verbosity_(options.verbosity), aaf_(LoadAafLibrary(options)) {
     NMASetLogLevel(options.verbosity >= 2 ? 8 : options.verbosity == 1 ? 1 : 0);
 
     host_ = std::make_unique<host::Host>(options.host);

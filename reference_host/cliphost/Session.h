@@ -26,6 +26,9 @@ struct SessionOptions {
     int verbosity = 0;
 };
 
+// The AAF library that the command line means, for verbs that need no module. Throws a Failure.
+std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options);
+
 // A host with all its services and the module loaded into it.
 class Session {
 public:

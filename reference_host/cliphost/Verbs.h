@@ -19,6 +19,7 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status);
 void AddAudio(CLI::App& app, const SessionOptions& session, int& status);
 void AddTypes(CLI::App& app, const SessionOptions& session, int& status);
 void AddParams(CLI::App& app, const SessionOptions& session, int& status);
+void AddDump(CLI::App& app, const SessionOptions& session);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
 
 }  // namespace cliphost

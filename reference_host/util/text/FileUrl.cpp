@@ -65,17 +65,28 @@ bool IsFileUrl(std::string_view text) {
     return text.substr(0, kScheme.size()) == kScheme;
 }
 
-bool PathOfFileUrl(std::string_view url, std::string& path) {
+bool SplitFileUrl(std::string_view url, std::string& machine, std::string& path) {
     if (!IsFileUrl(url)) {
         return false;
     }
     url.remove_prefix(kScheme.size());
-    if (url.substr(0, kThisMachine.size()) == kThisMachine) {
-        url.remove_prefix(kThisMachine.size());
+    const std::size_t slash = url.find('/');
+    std::string ofMachine;
+    std::string ofPath;
+    if (slash == std::string_view::npos || !PercentDecoded(url.substr(0, slash), ofMachine) ||
+        !PercentDecoded(url.substr(slash), ofPath) || ofMachine.find('\0') != std::string::npos ||
+        ofPath.find('\0') != std::string::npos) {
+        return false;
     }
+    machine = ofMachine == kThisMachine ? std::string() : std::move(ofMachine);
+    path = std::move(ofPath);
+    return true;
+}
+
+bool PathOfFileUrl(std::string_view url, std::string& path) {
+    std::string machine;
     std::string decoded;
-    if (url.empty() || url[0] != '/' || !PercentDecoded(url, decoded) ||
-        decoded.find('\0') != std::string::npos) {
+    if (!SplitFileUrl(url, machine, decoded) || !machine.empty()) {
         return false;
     }
     path = std::move(decoded);

@@ -20,6 +20,10 @@ std::string FileUrl(std::string_view path);
 // Whether a text is meant as a file URL.
 bool IsFileUrl(std::string_view text);
 
+// The parts of a file URL, decoded: the machine, empty for this one, and the rooted path. False,
+// with both unchanged, for one without a rooted path, and for one with a byte of zero.
+bool SplitFileUrl(std::string_view url, std::string& machine, std::string& path);
+
 // The path that a file URL names on this machine. False, with `path` unchanged,
 // for one that names another machine, no rooted path, or a byte of zero.
 bool PathOfFileUrl(std::string_view url, std::string& path);

@@ -47,3 +47,21 @@ TEST(FileUrl, IsKnownByItsScheme) {
 }
 
 }  // namespace
+
+TEST(SplitFileUrl, GivesTheMachineAndThePath) {
+    std::string machine = "before", path = "before";
+    EXPECT_TRUE(host::text::SplitFileUrl("file://server/a%20b/c", machine, path));
+    EXPECT_EQ(machine, "server");
+    EXPECT_EQ(path, "/a b/c");
+    EXPECT_TRUE(host::text::SplitFileUrl("file://localhost/c", machine, path));
+    EXPECT_EQ(machine, "") << "this machine";
+}
+
+TEST(SplitFileUrl, LeavesBothAloneWhereItFails) {
+    std::string machine = "before", path = "before";
+    for (const char* const url : {"http://a/b", "file://server", "file://", "file:///%zz",
+                                  "file://%00/a", "file:///%00", "/a"}) {
+        EXPECT_FALSE(host::text::SplitFileUrl(url, machine, path)) << url;
+        EXPECT_EQ(machine + path, "beforebefore") << url;
+    }
+}

@@ -1,0 +1,55 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+#include <fmt/format.h>
+
+#include "reference_host/cliphost/AafTree.h"
+#include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/JsonText.h"
+#include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/Verbs.h"
+
+namespace cliphost {
+namespace {
+
+constexpr int kLevelOfTree = 1;  // in the answer
+
+// A tree may be large, so it isn't made into another value first.
+void PrintTreeAsJson(const std::filesystem::path& file, const TreeNode& tree) {
+    std::string text = "{\n  \"aaf\": ";
+    AppendJsonText(MachinePath(file), text);
+    text += ",\n  \"description\": " + ToJson(tree, kLevelOfTree) + "\n}\n";
+    fmt::print("{}", text);
+}
+
+}  // namespace
+
+void AddDump(CLI::App& app, const SessionOptions& options) {
+    auto* const verb =
+        app.add_subcommand("dump", "Show the mob tree of an AAF file, whoever made it");
+    verb->footer("Example: cliphost dump clip.aaf");
+    auto file = std::make_shared<std::filesystem::path>();
+    auto json = std::make_shared<bool>(false);
+    verb->add_option("file", *file, "The AAF file")->required();
+    verb->add_flag("--json", *json, kJsonHelp);
+    verb->callback([&options, file, json] {
+        AnswerFailureToo(*json, {{"aaf", MachinePath(*file)}}, [&] {
+            if (Problem problem = WhyUnreadable(*file)) {
+                if (std::filesystem::is_directory(*file)) {
+                    problem.hint = "give an AAF file in it";
+                }
+                throw Failure(problem);
+            }
+            const std::unique_ptr<AafLibrary> library = LoadAafLibrary(options);
+            const TreeNode tree = ReadTree(library->Open(*file).get());
+            if (*json) {
+                PrintTreeAsJson(*file, tree);
+            } else {
+                fmt::print("{}", ToReadableText(tree));
+            }
+        });
+    });
+}
+
+}  // namespace cliphost
