@@ -69,6 +69,30 @@ private:
     std::string text_;
 };
 
+// How files name this program as their writer.
+class ThisProgram {
+public:
+    ThisProgram() {
+        identification_.companyName = company_;
+        identification_.productName = product_;
+        identification_.productVersionString = versionText_;
+        identification_.productID = ncfGuid("6E2E6B0C-53C1-4D4B-8B1D-2F9C6A7E1C55");
+        identification_.platform = platform_;
+        identification_.productVersion = &version_;
+    }
+    ThisProgram(const ThisProgram&) = delete;
+    ThisProgram& operator=(const ThisProgram&) = delete;
+    aafProductIdentification_t* identification() { return &identification_; }
+
+private:
+    aafCharacter company_[9] = L"Cliphost";
+    aafCharacter product_[9] = L"cliphost";
+    aafCharacter versionText_[sizeof PRODUCT_VERSION_TEXT] = L"" PRODUCT_VERSION_TEXT;
+    aafCharacter platform_[1] = L"";
+    aafProductVersion_t version_{PRODUCT_VERSION_NUMBERS, 0, kAAFVersionReleased};
+    aafProductIdentification_t identification_{};
+};
+
 }  // namespace
 
 AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
@@ -121,19 +145,7 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
         return;
     }
     const auto openNew = find<AAFFileOpenNewModifyExFunction>("AAFFileOpenNewModifyEx");
-    aafCharacter company[] = L"Cliphost";
-    aafCharacter product[] = L"cliphost";
-    aafCharacter version[] = L"" PRODUCT_VERSION_TEXT;
-    aafCharacter platform[] = L"";
-    aafProductVersion_t productVersion{PRODUCT_VERSION_NUMBERS, 0, kAAFVersionReleased};
-    aafProductIdentification_t identification{};
-    identification.companyName = company;
-    identification.productName = product;
-    identification.productVersionString = version;
-    identification.productID = ncfGuid("6E2E6B0C-53C1-4D4B-8B1D-2F9C6A7E1C55");
-    identification.platform = platform;
-    identification.productVersion = &productVersion;
-
+    ThisProgram program;
     OutputFile output(path, OutputFile::Writer::Other);
     const LibrarySentence said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
     const auto check = [&](HRESULT result, const char* step) {
@@ -153,12 +165,29 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     };
     host::Ref<IAAFFile> copy;
     check(openNew(WideName(output.NameForOther()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
-                  &identification, copy.Out()),
+                  program.identification(), copy.Out()),
           "opening a new file");
     // This saves the copy, too.
     check(file->SaveCopyAs(copy.get()), "copying the description");
     check(copy->Close(), "closing");
     output.Finish();
+}
+
+void AafLibrary::TryToSave(const std::filesystem::path& path) const {
+    if (!OutputFile::IsDevice(path)) {
+        OutputFile(path, OutputFile::Writer::Other).TryPlace();
+    }
+}
+
+host::Ref<IAAFFile> AafLibrary::OpenTransient() const {
+    const auto open = find<AAFFileOpenTransientFunction>("AAFFileOpenTransient");
+    ThisProgram program;
+    host::Ref<IAAFFile> file;
+    const HRESULT result = open(program.identification(), file.Out());
+    if (result < 0) {
+        throw Failure(kExitCaller, file_, "no file can be made in memory: " + TextOfResult(result));
+    }
+    return file;
 }
 
 host::Ref<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {

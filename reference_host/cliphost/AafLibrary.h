@@ -30,6 +30,10 @@ public:
     // replaced once the new one is whole; a device is written. Throws a Failure,
     // or ReaderGone.
     void Save(IAAFFile* file, const std::filesystem::path& path) const;
+    // Throws that Failure early for a path where nothing can be saved, and leaves nothing there.
+    void TryToSave(const std::filesystem::path& path) const;
+    // A new file in memory. Throws a Failure.
+    host::Ref<IAAFFile> OpenTransient() const;
     // Opens a saved file for reading. Throws a Failure.
     host::Ref<IAAFFile> Open(const std::filesystem::path& path) const;
 

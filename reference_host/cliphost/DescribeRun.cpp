@@ -7,7 +7,9 @@
 #include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/Stringout.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -37,11 +39,53 @@ std::string EntryText(const ordered_json& head, const std::string& description) 
 
 }  // namespace
 
+DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
+    : MoviesRun(session, options.movies, "describing", ".aaf"),
+      options_(options),
+      maps_(options.form.maps) {
+    if (!options.movies.together.empty()) {
+        session.aaf().TryToSave(options.movies.together);
+        bin_.emplace(session.aaf());
+    }
+}
+
 MovieAnswer DescribeRun::Answer(const MovieStep& step, const PlaceOfFile& place) {
     const Description description =
         step.folder ? DescribeFromList(session(), step.folder->list(), step.index, step.movie)
                     : DescribeMovie(session(), step.movie);
-    return AnswerOf(session(), description, options_.form, place);
+    const MovieAnswer answer = AnswerOf(session(), description, options_.form, place);
+    if (bin_ && description.file) {
+        AddToBin(description.file.get(), step.movie);
+    }
+    return answer;
+}
+
+void DescribeRun::Collect(const std::filesystem::path& movie, const std::filesystem::path& file) {
+    AddToBin(session().aaf().Open(file).get(), movie);
+}
+
+void DescribeRun::AddToBin(IAAFFile* description, const std::filesystem::path& movie) {
+    copyOf_ = bin_->Add(description, movie);
+    if (!copyOf_.empty()) {
+        Notice("cliphost: {}: has the content of {}; one clip of the bin names both\n",
+               DisplayPath(movie), DisplayPath(copyOf_));
+    }
+}
+
+// Without a clip nothing is saved.
+void DescribeRun::SaveBin() {
+    const std::filesystem::path& file = options_.movies.together;
+    if (bin_->clips().empty()) {
+        throw Failure(kExitFile, file, "not written: no movie was described");
+    }
+    if (options_.stringout) {
+        AddStringout(session().aaf(), *bin_, file.stem().string(), options_.editorRate);
+    }
+    bin_->Save(file);
+}
+
+void DescribeRun::AddEntry(const ordered_json& head, const std::string& description) {
+    entries_.push_back(EntryText(head, description));
 }
 
 bool DescribeRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
@@ -52,7 +96,7 @@ void DescribeRun::ShowFailure(const std::filesystem::path& movie, const Problem&
     if (options_.form.json) {
         ordered_json head = {{"movie", MachinePath(movie)}};
         AddProblem(problem, head);
-        entries_.push_back(EntryText(head, ""));
+        AddEntry(head, "");
     }
 }
 
@@ -71,6 +115,9 @@ void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& an
     if (!saved.empty()) {
         head["aaf"] = MachinePath(saved);
     }
+    if (!copyOf_.empty()) {
+        head["copyOf"] = MachinePath(copyOf_);
+    }
     if (answer.problem) {
         AddProblem(answer.problem, head);
     }
@@ -78,10 +125,20 @@ void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& an
     if (!answer.routeReason.empty()) {
         head["routeReason"] = answer.routeReason;
     }
-    entries_.push_back(EntryText(head, answer.description));
+    AddEntry(head, answer.description);
 }
 
 void DescribeRun::Finish(int described, int failed) {
+    if (bin_) {
+        try {
+            SaveBin();
+        } catch (const Failure& failure) {
+            TellAlso(failure);
+            ordered_json head = {{"aaf", MachinePath(options_.movies.together)}};
+            AddProblem(failure.problem(), head);
+            AddEntry(head, "");
+        }
+    }
     for (const std::string& rule : maps_.Unused()) {
         if (described > 0) {
             TellAlso(Failure(kExitCaller, "--map " + rule, "nothing was mapped by it",
@@ -89,7 +146,9 @@ void DescribeRun::Finish(int described, int failed) {
         }
     }
     if (!options_.form.json) {
-        if (described + failed != 1 && !host::system::IsStandardOutput(options_.movies.file)) {
+        const bool isTaken = host::system::IsStandardOutput(options_.movies.file) ||
+                             host::system::IsStandardOutput(options_.movies.together);
+        if (described + failed != 1 && !isTaken) {
             fmt::print("{} described, {} not\n", described, failed);
         }
         return;

@@ -2,6 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <nlohmann/json_fwd.hpp>
+#include <optional>
+
+#include "reference_host/cliphost/Bin.h"
 #include "reference_host/cliphost/MoviesRun.h"
 
 namespace cliphost {
@@ -9,15 +13,14 @@ namespace cliphost {
 struct DescribeOptions {
     MoviesOptions movies;
     DescriptionForm form;
+    bool stringout = false;
+    double editorRate = 25.0;  // frames per second
 };
 
 // Describes all movies of the command line.
 class DescribeRun final : public MoviesRun {
 public:
-    DescribeRun(Session& session, const DescribeOptions& options)
-        : MoviesRun(session, options.movies, "describing", ".aaf"),
-          options_(options),
-          maps_(options.form.maps) {}
+    DescribeRun(Session& session, const DescribeOptions& options);
 
 private:
     MovieAnswer Answer(const MovieStep& step, const PlaceOfFile& place) override;
@@ -25,10 +28,16 @@ private:
     void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
               const std::filesystem::path& saved) override;
     void ShowFailure(const std::filesystem::path& movie, const Problem& problem) override;
+    void Collect(const std::filesystem::path& movie, const std::filesystem::path& file) override;
     void Finish(int described, int failed) override;
+    void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
+    void SaveBin();
+    void AddEntry(const nlohmann::ordered_json& head, const std::string& description);
 
     const DescribeOptions& options_;
-    PathMaps maps_;                     // to know which were used
+    PathMaps maps_;  // to know which were used
+    std::optional<Bin> bin_;
+    std::filesystem::path copyOf_;      // what the last movie that went into the bin is a copy of
     std::vector<std::string> entries_;  // of the JSON list
 };
 

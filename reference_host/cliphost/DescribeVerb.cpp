@@ -71,6 +71,16 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_option("--out-dir", options->movies.outFolder,
                      "Save every movie's file in this folder")
         ->excludes(aaf);
+    auto* const bin =
+        verb->add_option("--bin", options->movies.together,
+                         "Save one file here with the clips of all movies; copies of a movie are "
+                         "one clip with several places")
+            ->excludes(aaf)
+            ->excludes("--out-dir");
+    verb->add_flag("--stringout", options->stringout,
+                   "Add a sequence to the bin, all clips end to end at the editor rate, for "
+                   "programs that show sequences alone")
+        ->needs(bin);
     AddForm(*verb, options->form, *pinned);
     AddWorkerOptions(*verb, options->movies.workers);
     AddDescribeForParent(app, session, status);
@@ -86,6 +96,11 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                 throw Failure(kExitCaller, "--aaf", "standard output takes the JSON",
                               "name a file");
             }
+            if (options->form.json && host::system::IsStandardOutput(options->movies.together)) {
+                throw Failure(kExitCaller, "--bin", "standard output takes the JSON",
+                              "name a file");
+            }
+            options->editorRate = session.host.editorFrameRate.value_or(options->editorRate);
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));
             status = DescribeRun(running, *options).Run();

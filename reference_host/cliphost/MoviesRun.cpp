@@ -44,6 +44,7 @@ int MoviesRun::Run() {
         folder.emplace(options_.outFolder);
     }
     Plan();
+    RefuseOneForAllOntoMovie();
     std::size_t movies = 0;
     bool isOurs = false;  // a descriptor is that of this process
     for (std::size_t i = 0; i < steps_.size(); ++i) {
@@ -119,6 +120,15 @@ void MoviesRun::Refuse(const std::filesystem::path& path, int status, const Prob
     Add({path.native(), {}, 0, std::make_shared<const Failure>(status, problem), {}});
 }
 
+// It is written when all movies were read: none of them may be there.
+void MoviesRun::RefuseOneForAllOntoMovie() const {
+    if (!options_.together.empty() && host::system::NumberOf(options_.together)) {
+        for (std::size_t i = 0; i < steps_.size(); ++i) {
+            RefuseOutputOntoMovie(options_.together, StepAt(i).movie);
+        }
+    }
+}
+
 void MoviesRun::RunHere() {
     if (steps_.size() > 1) {
         progress_.emplace(doing_, steps_.size());
@@ -138,7 +148,7 @@ void MoviesRun::RunHere() {
                 saved = options_.Saves() ? TargetFor(step.movie) : std::filesystem::path();
                 return saved;
             });
-            Settle(step.movie, answer, saved);
+            Settle(step.movie, answer, options_.together.empty() ? saved : options_.together);
         });
     }
     progress_.reset();
@@ -170,7 +180,9 @@ void MoviesRun::RunInChildren() {
                                          return StepAt(placesOfRequests_[number]).movie;
                                      }};
     WorkerCall call = options_.workers;
-    if (options_.Saves()) {
+    if (!options_.together.empty()) {
+        call.writeNear = host::system::TemporaryFolder();
+    } else if (options_.Saves()) {
         call.writeNear = PlaceToWrite();
     }
     progress_.emplace(doing_, requests.count);
@@ -206,7 +218,13 @@ void MoviesRun::Deliver(const MovieStep& step, std::size_t number, const WorkerR
     }
     MovieAnswer& answer = answers_[number];
     std::filesystem::path saved;
-    if (options_.Saves()) {
+    if (!options_.together.empty() && answer.status == kExitFine) {
+        const std::filesystem::path file = PrivateFile(result.folder, number);
+        Collect(step.movie, file);
+        std::error_code ignored;
+        std::filesystem::remove(file, ignored);
+        saved = options_.together;
+    } else if (options_.Saves()) {
         const std::filesystem::path file = PrivateFile(result.folder, number);
         const bool isSaved = answer.status == kExitFine;
         const bool isNotSaved = !isSaved && answer.problem.subject == file;

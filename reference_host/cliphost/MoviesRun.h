@@ -23,6 +23,7 @@ struct MoviesOptions {
     std::vector<std::filesystem::path> paths;  // movies and folders
     std::filesystem::path file;                // for what is made of the only movie
     std::filesystem::path outFolder;           // for what is made of each
+    std::filesystem::path together;            // for what is made of all
     WorkerCall workers;                        // without `writeNear`
 
     bool Saves() const { return !file.empty() || !outFolder.empty(); }
@@ -59,6 +60,9 @@ protected:
     virtual void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
                       const std::filesystem::path& saved) = 0;
     virtual void ShowFailure(const std::filesystem::path&, const Problem&) {}
+    // What is made of all takes the file that a child process has made of one.
+    virtual void Collect(const std::filesystem::path& /*movie*/,
+                         const std::filesystem::path& /*file*/) {}
     // After all.
     virtual void Finish(int /*done*/, int /*failed*/) {}
 
@@ -70,6 +74,7 @@ private:
     void Plan();
     void PlanFolder(const std::filesystem::path& folder);
     void Refuse(const std::filesystem::path& path, int status, const Problem& problem);
+    void RefuseOneForAllOntoMovie() const;
     void RunHere();
     void RunInChildren();
     std::filesystem::path PlaceToWrite() const;

@@ -157,4 +157,223 @@ TEST_F(MappedPaths, RefuseWhatIsNoRule) {
     ExpectSays(RunCliphost("describe x.mov --map /a=b"), 2, "--map /a=b: TO is no absolute path");
 }
 
+class BinFile : public AafFiles {
+protected:
+    // Movies of the test's own, each with another content.
+    std::string Movie(const std::string& name, int pictures, int sounds, int frames) {
+        std::vector<movies::Track> tracks;
+        for (int i = 0; i < pictures; ++i) {
+            tracks.push_back(movies::VideoTrack({}, frames, 25, 1));
+        }
+        for (int i = 0; i < sounds; ++i) {
+            tracks.push_back(movies::SoundTrack({}, frames * 1920));
+        }
+        fs::create_directories(folder() / "in");
+        return Write(movies::Movie{tracks}, "in/" + name);
+    }
+    Json Dump(const std::string& file) {
+        const CommandResult dumped = Cliphost("dump --json " + In(file));
+        EXPECT_EQ(dumped.status, 0) << dumped.out;
+        return Json::parse(dumped.out)["description"];
+    }
+    static std::vector<Json> MobsOf(const Json& tree, const std::string& kind) {
+        std::vector<Json> mobs;
+        for (const Json& mob : tree["Mobs"]) {
+            if (mob["class"] == kind) {
+                mobs.push_back(mob);
+            }
+        }
+        return mobs;
+    }
+    // The parts of a sequence's track as "clip 10", "gap 5".
+    static std::vector<std::string> PartsOf(const Json& slot) {
+        std::vector<std::string> parts;
+        for (const Json& part : slot["Segment"][0]["Components"]) {
+            parts.push_back((part["class"] == "Filler" ? "gap " : "clip ") +
+                            part["Length"].get<std::string>());
+        }
+        return parts;
+    }
+};
+
+TEST_F(BinFile, HoldsTheMobsOfEachMovieAsTheirOwnFilesDo) {
+    Movie("a.mov", 1, 1, 10);
+    Movie("b.mov", 1, 0, 20);
+    const std::string pinned = " --pin-time 2026-01-31T12:00:00Z ";
+    for (const char* const jobs : {"1", "2"}) {
+        const std::string call = "describe -q --jobs " + std::string(jobs) + pinned + In("in");
+        ASSERT_EQ(RunCliphost(call + " --bin " + In("bin.aaf")).status, 0);
+        ASSERT_EQ(RunCliphost(call + " --out-dir " + In("out")).status, 0);
+        std::set<std::string> single;
+        for (const char* const file : {"out/a.aaf", "out/b.aaf"}) {
+            const Json tree = Dump(file);
+            for (const Json& mob : tree["Mobs"]) {
+                single.insert(mob.dump());
+            }
+        }
+        std::set<std::string> together;
+        const Json tree = Dump("bin.aaf");
+        for (const Json& mob : tree["Mobs"]) {
+            together.insert(mob.dump());
+        }
+        EXPECT_EQ(together.size(), 6u);
+        EXPECT_EQ(together, single);
+    }
+}
+
+TEST_F(BinFile, HasTheSameBytesFromOneProcessAndFromSeveral) {
+    Movie("a.mov", 1, 1, 10);
+    Movie("b.mov", 1, 0, 20);
+    Movie("c.mov", 0, 2, 5);
+    std::vector<movies::Bytes> files;
+    for (const char* const jobs : {"1", "3"}) {
+        ASSERT_EQ(RunCliphost("describe -q --stringout --pin-time 2026-01-31T12:00:00Z --jobs " +
+                              std::string(jobs) + " " + In("in") + " --bin " + In("bin.aaf"))
+                      .status,
+                  0);
+        files.push_back(ReadFile(folder() / "bin.aaf"));
+    }
+    EXPECT_TRUE(files[0] == files[1]);
+}
+
+TEST_F(BinFile, MakesCopiesOneClipWithTwoPlacesAndTellsSo) {
+    Copy("a.mov");
+    Copy("b.mov");
+    for (const char* const jobs : {"1", "2"}) {
+        const CommandResult run = RunCliphost("describe -q --jobs " + std::string(jobs) + " " +
+                                              In("in") + " --bin " + In("bin.aaf"));
+        ExpectSays(run, 0, "b.mov: has the content of " + (folder() / "in/a.mov").string());
+        const Json tree = Dump("bin.aaf");
+        EXPECT_EQ(tree["Mobs"].size(), 3u);
+        for (const Json& mob : MobsOf(tree, "SourceMob")) {
+            std::set<std::string> urls;
+            Collect(mob, "URLString", urls);
+            EXPECT_EQ(urls.size(), 2u) << mob;
+        }
+    }
+    const CommandResult json =
+        Cliphost("describe --json " + In("in") + " --bin " + In("bin.aaf") + " 2>/dev/null");
+    const Json answer = Json::parse(json.out);
+    EXPECT_FALSE(answer[0].contains("copyOf"));
+    EXPECT_EQ(answer[1]["copyOf"], (folder() / "in/a.mov").string());
+    EXPECT_EQ(answer[1]["aaf"], (folder() / "bin.aaf").string());
+}
+
+TEST_F(BinFile, HoldsTheRestWhereAMovieFails) {
+    Movie("a.mov", 1, 0, 10);
+    std::ofstream(folder() / "in/b.mov") << "no movie at all";
+    const CommandResult run = RunCliphost("describe -q " + In("in") + " --bin " + In("bin.aaf"));
+    ExpectSays(run, 1, "1 described, 1 not");
+    EXPECT_EQ(Dump("bin.aaf")["Mobs"].size(), 3u);
+}
+
+TEST_F(BinFile, IsNotWrittenWithoutAClip) {
+    fs::create_directories(folder() / "in");
+    std::ofstream(folder() / "in/b.mov") << "no movie at all";
+    ExpectSays(RunCliphost("describe -q " + In("in/b.mov") + " --bin " + In("bin.aaf")), 1,
+               "bin.aaf: not written: no movie was described");
+    EXPECT_FALSE(fs::exists(folder() / "bin.aaf"));
+    const CommandResult json =
+        Cliphost("describe --json " + In("in/b.mov") + " --bin " + In("bin.aaf") + " 2>/dev/null");
+    EXPECT_EQ(Json::parse(json.out)[1]["aaf"], (folder() / "bin.aaf").string());
+}
+
+TEST_F(BinFile, IsRefusedBeforeAnythingIsReadWhereItCanNotBeWritten) {
+    Movie("a.mov", 1, 0, 10);
+    const CommandResult run =
+        RunCliphost("describe -q " + In("in") + " --bin " + In("no/folder/bin.aaf"));
+    EXPECT_EQ(run.status, 2);
+    EXPECT_NE(run.out.find("no/folder/bin.aaf: not written"), std::string::npos) << run.out;
+    EXPECT_EQ(run.out.find("a.mov"), std::string::npos) << run.out;
+}
+
+TEST_F(BinFile, IsNeverWrittenOntoAMovie) {
+    Movie("a.mov", 1, 0, 10);
+    const movies::Bytes before = ReadFile(folder() / "in/a.mov");
+    ExpectSays(RunCliphost("describe -q " + In("in") + " --bin " + In("in/a.mov")), 2,
+               "this is the movie itself");
+    EXPECT_TRUE(ReadFile(folder() / "in/a.mov") == before);
+}
+
+TEST_F(BinFile, TakesThePlaceOfAnOtherPlaceToSave) {
+    for (const char* const other : {"--aaf x.aaf", "--out-dir x"}) {
+        EXPECT_EQ(RunCliphost("describe x.mov --bin b.aaf " + std::string(other)).status, 2);
+    }
+    ExpectSays(RunCliphost("describe x.mov --stringout"), 2, "--stringout requires --bin");
+    ExpectSays(RunCliphost("describe x.mov --json --bin -"), 2, "standard output takes the JSON");
+}
+
+TEST_F(BinFile, GoesToStandardOutput) {
+    Movie("a.mov", 1, 0, 10);
+    Movie("b.mov", 1, 0, 11);
+    ASSERT_EQ(Cliphost("describe " + In("in") + " --bin - > " + In("bin.aaf")).status, 0);
+    EXPECT_EQ(Dump("bin.aaf")["Mobs"].size(), 6u);
+}
+
+class Stringout : public BinFile {
+protected:
+    // The tracks of the sequence of all movies in the folder `in`.
+    Json SequenceOf(const std::string& options = "") {
+        EXPECT_EQ(RunCliphost(options + " describe -q " + In("in") + " --stringout --bin " +
+                              In("bin.aaf"))
+                      .status,
+                  0);
+        const std::vector<Json> sequences = MobsOf(Dump("bin.aaf"), "CompositionMob");
+        EXPECT_EQ(sequences.size(), 1u);
+        return sequences.empty() ? Json() : sequences[0];
+    }
+};
+
+TEST_F(Stringout, PutsAllClipsEndToEnd) {
+    Movie("a.mov", 1, 1, 10);
+    Movie("b.mov", 1, 2, 20);
+    Movie("c.mov", 0, 1, 5);
+    Movie("d.mov", 1, 0, 7);
+    const Json sequence = SequenceOf();
+    EXPECT_EQ(sequence["Name"], "\"bin\"");
+    const Json& slots = sequence["Slots"];
+    ASSERT_EQ(slots.size(), 6u) << "a picture, two sounds of two channels, timecode";
+    using Parts = std::vector<std::string>;
+    EXPECT_EQ(PartsOf(slots[0]), (Parts{"clip 10", "clip 20", "gap 5", "clip 7"}));
+    EXPECT_EQ(PartsOf(slots[1]), (Parts{"clip 10", "clip 20", "clip 5", "gap 7"}));
+    EXPECT_EQ(PartsOf(slots[2]), PartsOf(slots[1]));
+    EXPECT_EQ(PartsOf(slots[3]), (Parts{"gap 10", "clip 20", "gap 12"}));
+    EXPECT_EQ(slots[5]["Segment"][0]["Length"], "42");
+    EXPECT_EQ(slots[5]["Segment"][0]["Start"], "90000") << "one hour";
+    for (const Json& slot : slots) {
+        EXPECT_EQ(slot["EditRate"], "25/1");
+    }
+}
+
+TEST_F(Stringout, CountsInFramesOfTheEditor) {
+    Movie("a.mov", 1, 0, 25);
+    const Json slots = SequenceOf("--editor-rate 23.976")["Slots"];
+    EXPECT_EQ(slots[0]["EditRate"], "24000/1001");
+    EXPECT_EQ(PartsOf(slots[0]), std::vector<std::string>{"clip 23"}) << "never beyond the media";
+    EXPECT_EQ(slots[1]["Segment"][0]["FPS"], "24");
+}
+
+TEST_F(Stringout, NamesAClipOnceThatHasCopies) {
+    Copy("a.mov");
+    Copy("b.mov");
+    EXPECT_EQ(PartsOf(SequenceOf()["Slots"][0]).size(), 1u);
+}
+
+TEST_F(Stringout, RefersToTheClipsByTheirIdsAndSlots) {
+    Movie("a.mov", 1, 0, 10);
+    const Json sequence = SequenceOf();
+    const Json master = MobsOf(Dump("bin.aaf"), "MasterMob").at(0);
+    const Json& clip = sequence["Slots"][0]["Segment"][0]["Components"][0];
+    EXPECT_EQ(clip["SourceID"], master["MobID"]);
+    EXPECT_EQ(clip["StartTime"], "0");
+    std::set<std::string> pictures;
+    for (const Json& slot : master["Slots"]) {
+        if (slot["Segment"][0]["DataDefinition"].get<std::string>().find("Picture") !=
+            std::string::npos) {
+            pictures.insert(slot["SlotID"].get<std::string>());
+        }
+    }
+    EXPECT_EQ(pictures.count(clip["SourceMobSlotID"]), 1u);
+}
+
 }  // namespace
