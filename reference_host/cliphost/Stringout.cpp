@@ -26,7 +26,7 @@ namespace {
 constexpr aafUID_t kTopLevel = ncfGuid("0D010102-0101-0700-060E-2B3404010101");
 constexpr aafFrameOffset_t kSecondsAtStart = 3600;
 
-enum class Track { None, Picture, Sound };
+enum class MediaKind { None, Picture, Sound };
 
 struct Part {
     aafSlotID_t slot;
@@ -50,19 +50,19 @@ struct Clip {
     }
 };
 
-Track TrackOf(IAAFMobSlot& slot) {
+MediaKind TrackOf(IAAFMobSlot& slot) {
     host::Ref<IAAFDataDef> data;
     aafUID_t id{};
     if (slot.GetDataDef(data.Out()) < 0) {
-        return Track::None;
+        return MediaKind::None;
     }
     const auto definition = As<IAAFDefObject>(data.get());
     if (!definition || definition->GetAUID(&id) < 0) {
-        return Track::None;
+        return MediaKind::None;
     }
-    return id == kAAFDataDef_Picture || id == kAAFDataDef_LegacyPicture ? Track::Picture
-           : id == kAAFDataDef_Sound || id == kAAFDataDef_LegacySound   ? Track::Sound
-                                                                        : Track::None;
+    return id == kAAFDataDef_Picture || id == kAAFDataDef_LegacyPicture ? MediaKind::Picture
+           : id == kAAFDataDef_Sound || id == kAAFDataDef_LegacySound   ? MediaKind::Sound
+                                                                        : MediaKind::None;
 }
 
 // Whole frames of the sequence in a slot; 0 where it has no length.
@@ -97,10 +97,10 @@ Clip ClipOf(IAAFMob& mob, const aafRational_t& rate) {
         if (mob.GetSlotAt(i, slot.Out()) < 0 || slot->GetSlotID(&id) < 0) {
             continue;
         }
-        const Track track = TrackOf(*slot);
-        const aafLength_t frames = track == Track::None ? 0 : FramesIn(*slot, rate);
+        const MediaKind track = TrackOf(*slot);
+        const aafLength_t frames = track == MediaKind::None ? 0 : FramesIn(*slot, rate);
         if (frames > 0) {
-            (track == Track::Picture ? clip.pictures : clip.sounds).push_back({id, frames});
+            (track == MediaKind::Picture ? clip.pictures : clip.sounds).push_back({id, frames});
         }
     }
     return clip;

@@ -103,7 +103,11 @@ NCFRESULT String::AssignUnits(ncfUInt32 keepAs, const Unit* text, ncfUInt32 unit
 }
 
 void String::HoldUtf8(std::string_view text) {
-    units_ = std::string(text);
+    if (auto* const held = std::get_if<std::string>(&units_)) {
+        held->assign(text);  // which may be its own
+    } else {
+        units_ = std::string(text);
+    }
     encoding_ = kNCFUTF8;
 }
 
