@@ -86,8 +86,8 @@ endfunction()
 #              [PROPERTIES name value ...])
 # A GoogleTest program, each of whose suites is one of ctest's rows. Of suites that fit one of the
 # regular expressions of APART each test is a row, and so a process, of its own: what they change
-# in their process would be there for their neighbours. IN_BATCHES: compiled as the
-# libraries are, because no two of its files give one name to two things.
+# in their process would be there for their neighbours. IN_BATCHES: compiled as the libraries are,
+# because no two of its files give one name to two things.
 function(test_program name)
   cmake_parse_arguments(ARG "IN_BATCHES" "FILTER" "SOURCES;LIBS;APART;PROPERTIES" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
