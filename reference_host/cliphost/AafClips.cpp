@@ -204,8 +204,9 @@ private:
         while (properties->NextOne(property.Out()) >= 0) {
             host::Ref<IAAFPropertyValue> value;
             if (property->GetValue(value.Out()) >= 0) {
-                values_.TakeObjects(value.get(),
-                                    [&](IAAFObject* part) { FindSources(part, found, depth + 1); });
+                values_.TypeOf(value.get()).TakeObjects(value.get(), [&](IAAFObject* part) {
+                    FindSources(part, found, depth + 1);
+                });
             }
         }
     }
