@@ -126,6 +126,8 @@ public:
                 }
             }
         }
+        std::stable_sort(clips.begin(), clips.end(),
+                         [](const AafClip& a, const AafClip& b) { return a.name < b.name; });
         return clips;
     }
 
@@ -225,7 +227,11 @@ std::string ShownOf(aafLength_t length) {
 }
 
 bool IsSameRate(const aafRational_t& a, const aafRational_t& b) {
-    return std::int64_t{a.numerator} * b.denominator == std::int64_t{b.numerator} * a.denominator;
+    const bool isSameForm = a.numerator == b.numerator && a.denominator == b.denominator;
+    // Nothing is known of what divides by nought.
+    const bool areRates = a.denominator != 0 && b.denominator != 0;
+    return isSameForm || (areRates && std::int64_t{a.numerator} * b.denominator ==
+                                          std::int64_t{b.numerator} * a.denominator);
 }
 
 // Differences, each with the slots that have it.

@@ -31,7 +31,7 @@ struct AafClip {
     std::vector<std::string> urls;    // what their locators hold, each once
 };
 
-// In the order of the file.
+// In the order of their names; a file keeps its mobs in that of their ids.
 std::vector<AafClip> ClipsOf(IAAFFile* file);
 
 // The mob's bytes, to find it again by.

@@ -60,6 +60,8 @@ public:
     // Describes the movies there, and those in the folders where a clip's is not in its place; each
     // movie once.
     void Check(const std::vector<CheckedClip*>& clips);
+    // All that were described, or tried.
+    const FactsOfMovies& movies() const { return facts_; }
     // Files in the folders that the module describes as no movie.
     std::size_t unreadable() const { return unreadable_; }
 

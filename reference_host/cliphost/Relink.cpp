@@ -203,23 +203,17 @@ int Relink(Session& session, RelinkOptions& options) {
         CheckedClip& placed = clips.emplace_back(check.Place(std::move(clip)));
         all.push_back(&placed);
     }
+    check.Check(all);
     const bool isThere = host::system::NumberOf(options.output).has_value();
-    const auto refuse = [&](const std::filesystem::path& movie) {
-        if (isThere && !movie.empty()) {
+    for (const auto& [movie, facts] : check.movies()) {
+        if (isThere) {
             RefuseOutputOntoMovie(options.output, movie);
         }
-    };
-    for (const CheckedClip& clip : clips) {
-        for (const ClipPlace& place : clip.places) {
-            refuse(place.path);
-        }
     }
-    check.Check(all);
 
     std::vector<RelinkPlan> plans;
     std::size_t counts[std::size(kNamesOfRelinked)] = {};
     for (const CheckedClip& clip : clips) {
-        std::for_each(clip.found.begin(), clip.found.end(), refuse);
         plans.push_back(PlanOf(clip, options.check.maps));
         ++counts[static_cast<int>(plans.back().what)];
     }
