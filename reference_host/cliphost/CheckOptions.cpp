@@ -9,13 +9,13 @@ namespace cliphost {
 
 CLI::Option* AddCheckOptions(CLI::App& verb, CheckOptions& options) {
     AddMapOption(verb, options.maps,
-                 "FROM=TO as `cliphost describe` was given it: what the file names in TO is in the "
+                 "FROM=TO, as `cliphost describe` takes it: what the file names in TO is in the "
                  "folder FROM of this machine; may be given several times");
     auto* const search =
         verb.add_option("--search", options.search,
-                        "Look in this folder, and in those in it, for the movies of clips of ours "
-                        "that are not in their places: by content, among files with the same "
-                        "endings; may be given several times")
+                        "A folder in which, and in the folders in it, movies are looked for that "
+                        "are not in their places: by their content, among files with the endings "
+                        "of those; may be given several times")
             ->allow_extra_args(false);
     AddWorkerOptions(verb, options.workers);
     return search;

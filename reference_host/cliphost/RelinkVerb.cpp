@@ -15,10 +15,11 @@ void AddRelink(CLI::App& app, const SessionOptions& session, int& status) {
         "relink",
         "Find moved movies by their content and write an AAF file anew with their places");
     verb->footer(
-        "Example: cliphost relink bin.aaf --search /mnt/new -o relinked.aaf\n"
-        "What else is in the file stays as it is, other makers' clips too.\n"
-        "Exit status: 0, every clip that can be matched by content leads to its movie; 1, some "
-        "don't, or the AAF file can't be read;\n2, the call is at fault.");
+        "Examples:\n"
+        "  cliphost relink bin.aaf --search /mnt/new -o relinked.aaf\n"
+        "  cliphost relink bin.aaf --search /mnt/new --map /mnt/new=M: -o bin.aaf\n\n"
+        "What else is in the file stays as it is, other makers' clips too. A clip whose movie is "
+        "not found gives\nstatus 1.");
     auto options = std::make_shared<RelinkOptions>();
     auto pinned = std::make_shared<std::string>();
     verb->add_option("file", options->file, "The AAF file")->required();

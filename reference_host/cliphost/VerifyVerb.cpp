@@ -13,13 +13,16 @@ void AddVerify(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb = app.add_subcommand(
         "verify", "Tell for each clip of AAF files whether its movie is still there and the same");
     verb->footer(
-        "Example: cliphost verify bin.aaf --map /mnt/media=//server/media\n"
-        "States: same; moved, found by its content elsewhere; changed, another movie is there or "
-        "it "
-        "is described otherwise now;\nmissing; unknown, where nobody can tell, as of other makers' "
-        "clips.\n"
-        "Exit status: 0, every clip is the same, or another maker's whose file is there; 1, a clip "
-        "is not, or an AAF file can't be read;\n2, the call is at fault.");
+        "Examples:\n"
+        "  cliphost verify bin.aaf\n"
+        "  cliphost verify bin.aaf --map /mnt/media=//server/media --search /mnt/archive\n\n"
+        "A clip is the same, moved (its movie is elsewhere), unknown (nobody can tell), missing "
+        "(no "
+        "file is there)\nor changed (another movie is there, or it is described otherwise now, as "
+        "under other settings).\n"
+        "A clip that is not the same gives status 1, as a file's fault does; the last line tells "
+        "them apart. Another\nmaker's clip that is unknown gives 0: nothing in it tells which "
+        "movie it is.");
     auto options = std::make_shared<VerifyOptions>();
     verb->add_option("files", options->files, "AAF files")->required();
     verb->add_flag("--json", options->json, kJsonHelp);
