@@ -100,15 +100,37 @@ protected:
     }
 
     // A file with the clip of a movie, and with one of another maker that names a URL.
-    void SaveWithForeignClip(const std::string& movie, const std::string& url) {
+    // Where `isLedTo`, the first leads to the other's media as well.
+    void SaveWithForeignClip(const std::string& movie, const std::string& url,
+                             bool isLedTo = false) {
         cliphost::Bin bin(session().aaf());
         if (!movie.empty()) {
             const cliphost::Description description =
                 cliphost::DescribeMovie(session(), folder() / movie);
             bin.Add(description.file.get(), movie);
         }
-        AddForeignClip(bin.file(), url);
+        AddForeignClip(bin.file(), url, isLedTo ? bin.clips().at(0).get() : nullptr);
         bin.Save(folder() / "bin.aaf");
+    }
+
+    // A file with one more place of each source mob.
+    void AddPlace(const std::string& from, const std::string& to, const std::string& url) {
+        session().aaf().SaveEdited(folder() / from, folder() / to, [&](IAAFFile* file) {
+            host::Ref<IAAFHeader> header;
+            host::Ref<IEnumAAFMobs> mobs;
+            host::Ref<IAAFMob> mob;
+            ASSERT_GE(file->GetHeader(header.Out()), 0);
+            ASSERT_GE(header->GetMobs(nullptr, mobs.Out()), 0);
+            while (mobs->NextOne(mob.Out()) >= 0) {
+                cliphost::ForEachDescriptorOf(*mob, [&](IAAFEssenceDescriptor& descriptor) {
+                    aafUInt32 count = 0;
+                    descriptor.CountLocators(&count);
+                    if (count > 0) {
+                        cliphost::AppendLocator(file, descriptor, url);
+                    }
+                });
+            }
+        });
     }
 
 private:
@@ -121,7 +143,7 @@ private:
         return made;
     }
 
-    void AddForeignClip(IAAFFile* file, const std::string& url) {
+    void AddForeignClip(IAAFFile* file, const std::string& url, IAAFMob* leading) {
         host::Ref<IAAFHeader> header;
         host::Ref<IAAFDictionary> dictionary;
         host::Ref<IAAFDataDef> picture;
@@ -144,6 +166,11 @@ private:
         ASSERT_GE(masterMob->SetName(L"foreign"), 0);
         aafCharacter category[] = L"Reel";
         ASSERT_GE(masterMob->AppendComment(category, L"A001"), 0);
+        if (leading) {
+            ASSERT_GE(As<IAAFMasterMob>(leading)->NewPhysSourceRef({25, 1}, 99, picture.get(),
+                                                                   {id, 1, 0}, 10),
+                      0);
+        }
         ASSERT_GE(header->AddMob(masterMob.get()), 0);
         ASSERT_GE(header->AddMob(sourceMob.get()), 0);
     }
@@ -382,6 +409,30 @@ TEST_F(RelinkVerb, LeavesAllElseAsItIs) {
     std::replace(urlsBefore.begin(), urlsBefore.end(), "\"" + UrlOf("in/a.mov") + "\"",
                  "\"" + UrlOf("new/a.mov") + "\"");
     EXPECT_EQ(urlsBefore, urlsAfter);
+}
+
+TEST_F(RelinkVerb, LeavesOtherMakersMediaOfAClipOfOursAsItIs) {
+    Movie("in/a.mov", 10);
+    SaveWithForeignClip("in/a.mov", UrlOf("in/foreign.mov"), true);
+    Move("in/a.mov", "new/a.mov");
+    ExpectSays(RunCliphost(Call()), 0, "1 clip relinked");
+    Texts urls = UrlsOf("out.aaf");
+    std::sort(urls.begin(), urls.end());
+    Texts expected = Twice({UrlOf("new/a.mov")});
+    expected.insert(expected.begin(), "\"" + UrlOf("in/foreign.mov") + "\"");
+    EXPECT_EQ(urls, expected);
+}
+
+TEST_F(RelinkVerb, KeepsWhatItCanNotCheckBesideWhatItCan) {
+    Movie("in/a.mov", 10);
+    Describe();
+    fs::copy_file(folder() / "bin.aaf", folder() / "first.aaf");
+    AddPlace("first.aaf", "bin.aaf", "file://server/media/a.mov");
+    Move("in/a.mov", "new/a.mov");
+    EXPECT_EQ(RunCliphost(Call()).status, 0);
+    Texts urls = UrlsOf("out.aaf");
+    EXPECT_EQ(urls, (Texts{"\"" + UrlOf("new/a.mov") + "\"", "\"file://server/media/a.mov\"",
+                           "\"" + UrlOf("new/a.mov") + "\"", "\"file://server/media/a.mov\""}));
 }
 
 TEST_F(RelinkVerb, MayWriteTheFileItself) {
