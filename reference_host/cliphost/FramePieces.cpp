@@ -96,13 +96,15 @@ void RunInPieces::WriteAll(const FramePlan& plan) {
     for (std::size_t i = 0; i <= plan.cuts.size(); ++i) {
         const std::uint64_t begin = i == 0 ? 0 : plan.cuts[i - 1];
         const std::uint64_t end = i == plan.cuts.size() ? plan.count : plan.cuts[i];
-        FrameRequest piece{sink().IsRaw() ? Kind::Raw : Kind::Pictures, {}, 1};
+        FrameRequest piece{sink().IsRaw() ? Kind::Raw : Kind::Pictures, {}, 1, 0};
         piece.wanted.range = {NumberOf(begin), NumberOf(end - 1) + 1, wanted().range.step};
+        piece.behind = NumberOf(plan.isInOneGo ? 0 : begin);
         requests_.push_back(piece);
         messages.push_back(piece.ToBytes());
     }
     WorkerCall call = options().workers;
     call.writeNear = FolderNearOutput();
+    call.jobs = plan.isInOneGo ? 1 : call.jobs;
     call.mostWaiting = kMostWaiting * call.jobs;
     RunInWorkers(call, messages, *this);
 }
@@ -168,8 +170,7 @@ public:
             }
             if (request.kind == Kind::Plan) {
                 answer.plan = source_->Plan(request.wanted);
-                answer.plan.cuts =
-                    source_->Cuts(request.wanted.range, answer.plan.count, request.jobs);
+                source_->Cut(answer.plan, request.wanted.range, request.jobs);
             } else {
                 WritePiece(number, request, answer);
             }
@@ -186,8 +187,13 @@ private:
             turn_ = isRaw ? PictureTurn() : form_.turn.TurnFor(movie_);
             std::fputc(kEndOfOpening, stderr);
         }
+        for (std::uint64_t before = request.behind; before < range.first && next_ != range.first;
+             before += range.step) {
+            source_->Pass(before);
+        }
         for (std::uint64_t i = 0, count = range.CountIn(*range.end); i < count; ++i) {
             const std::uint64_t frame = range.first + i * range.step;
+            next_ = frame + range.step;
             const bool isRead = source_->Read(frame);
             if (isRead) {
                 const MadeFrame made =
@@ -206,6 +212,7 @@ private:
     const FrameForm& form_;
     std::optional<FrameSource> source_;
     std::optional<PictureTurn> turn_;
+    std::uint64_t next_ = 0;  // behind the frame read last
 };
 
 }  // namespace

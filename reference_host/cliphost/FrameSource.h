@@ -38,6 +38,8 @@ struct FramePlan {
     std::uint64_t count = 0;
     std::string rawWords;             // as RawWords
     std::vector<std::uint64_t> cuts;  // where further pieces of the range begin, counted in frames
+    // Nothing tells which frames stand alone: each piece is read behind those before it.
+    bool isInOneGo = false;
 };
 
 // A movie whose frames are read one after the other; those of its alpha track, too, where they
@@ -48,12 +50,14 @@ public:
 
     // Throws a Failure when there is none of the frames. The plan is for one process.
     FramePlan Plan(const WantedFrames& wanted);
-    // Where pieces begin that keep `jobs` processes at work: each is long enough to be worth a
-    // request, short enough to lie ready on a disk, and begins with a frame that stands alone
+    // Adds where pieces begin that keep `jobs` processes at work: each is long enough to be worth
+    // a request, short enough to lie ready on a disk, and begins with a frame that stands alone
     // where one is near.
-    std::vector<std::uint64_t> Cuts(const FrameRange& range, std::uint64_t count, unsigned jobs);
+    void Cut(FramePlan& plan, const FrameRange& range, unsigned jobs);
     // Tells why a frame can't be read.
     bool Read(std::uint64_t frame);
+    // Reads it for those behind it.
+    void Pass(std::uint64_t frame);
 
     // Of the frame read last.
     const FrameReader& reader() const { return *reader_; }
@@ -62,6 +66,8 @@ public:
 private:
     std::uint64_t CountTo(const WantedFrames& wanted);
     bool StandsAlone(std::uint64_t frame);
+    bool TellsWhatStandsAlone();
+    NCFRESULT ReadBoth(std::uint64_t frame);
 
     Essence essence_;
     const ClipTrack track_;

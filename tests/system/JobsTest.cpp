@@ -503,6 +503,41 @@ TEST_F(JobsOfFrames, WriteTheSameOfAMovieOfLongGroups) {
               91u * 480 * 272 * 2);
 }
 
+// Such movies claim that every sample stands alone, and most of these samples don't.
+TEST_F(JobsOfFrames, WriteTheSameOfAMovieThatDoesNotListItsSyncSamples) {
+    const std::pair<const char*, const char*> codecs[] = {
+        {"rpza.mov", "-c:v rpza"},
+        {"mpeg2.mov", "-c:v mpeg2video -g 40 -bf 0"},
+        {"h264.mov", "-c:v libx264 -pix_fmt yuv420p -g 40 -bf 0"},
+        {"qtrle.mov", "-c:v qtrle -g 40"}};
+    for (const auto& [name, codec] : codecs) {
+        const auto movie = Movie(name, codec);
+        movies::Bytes bytes = ReadFile(movie);
+        const std::string list = "stss";
+        const auto at = std::search(bytes.begin(), bytes.end(), list.begin(), list.end());
+        std::copy_n("free", at == bytes.end() ? 0 : list.size(), at);
+        Write(bytes, "in/" + std::string(name));
+        const std::string call = Quoted(movie) + " --range ";
+        const Left whole = ExpectTheSame(call + "0:", "pictures", kTwo);
+        EXPECT_EQ(whole.printed.status, 0) << name;
+        EXPECT_EQ(whole.files.size(), 96u) << name;
+        ExpectTheSame(call + "0::2", "a.raw", kTwo);
+    }
+}
+
+// After a lost piece, the frames that the next one leans on are decoded anew.
+TEST_F(JobsOfFrames, ReadOnBehindALostPieceFromWhereAllBegan) {
+    const auto movie = Movie("crash-at-40.mov", "-c:v rpza");
+    const std::string call = "frame " + Quoted(movie) + " --range 0: --jobs 2 -o ";
+    ASSERT_EQ(RunCliphost(call + In("whole")).status, 0);
+    ExpectSays(Harmed(call + In("some")), 1, "frames 39 to 51 are left out: ");
+    const auto pictures = NamesIn(folder() / "some");
+    EXPECT_EQ(pictures.size(), 39u);
+    for (const std::string& name : pictures) {
+        EXPECT_TRUE(ReadFile(folder() / "some" / name) == ReadFile(folder() / "whole" / name));
+    }
+}
+
 TEST_F(JobsOfFrames, TellFramesThatCantBeReadInOrder) {
     const auto cut = Movie("cut.mov", kProRes + " -movflags +faststart");
     std::filesystem::resize_file(cut, std::filesystem::file_size(cut) * 2 / 3);
