@@ -65,7 +65,10 @@ FrameSource::FrameSource(Session& session, const std::filesystem::path& movie,
 
 FramePlan FrameSource::Plan(const WantedFrames& wanted) {
     const std::uint64_t count = wanted.range.CountIn(CountTo(wanted));
-    return {count, RawWords(*reader_, track_), {}, false};
+    if (!wanted.isOne) {
+        reader_->StartAnew();
+    }
+    return {count, reader_->frameBytes(), RawWords(*reader_, track_), {}, false};
 }
 
 std::uint64_t FrameSource::CountTo(const WantedFrames& wanted) {
@@ -73,7 +76,9 @@ std::uint64_t FrameSource::CountTo(const WantedFrames& wanted) {
     // One frame need not be counted: it is there or it is not.
     const bool isThere = wanted.isOne && range.first < reader_->MostFrames() &&
                          reader_->Read(range.first) != NMA_E_NODATA;
-    const std::uint64_t count = isThere ? range.first + 1 : reader_->Count();
+    const std::uint64_t count = isThere              ? range.first + 1
+                                : wanted.areBelieved ? reader_->MostFrames()
+                                                     : reader_->Count();
     if (count == 0) {
         throw Failure(kExitFile, essence_.WhyUnread(track_, range.first, NMA_E_NODATA));
     }
@@ -85,19 +90,25 @@ std::uint64_t FrameSource::CountTo(const WantedFrames& wanted) {
     return count;
 }
 
-void FrameSource::Cut(FramePlan& plan, const FrameRange& range, unsigned jobs) {
-    const std::uint64_t count = plan.count;
-    const std::uint64_t bytes = std::max<std::uint64_t>(reader_->frameBytes(), 1);
+PieceLength PieceLengthFor(std::uint64_t count, std::uint64_t frameBytes, unsigned jobs) {
+    const std::uint64_t bytes = std::max<std::uint64_t>(frameBytes, 1);
     const std::uint64_t least = std::max(kLeastFrames, kLeastBytes / bytes);
     const std::uint64_t even = count / (jobs * kPiecesForEach) + 1;
-    const std::uint64_t length =
+    PieceLength length;
+    length.usual =
         std::max(count / kMostCuts + 1, std::min(std::max(even, least), kMostBytes / bytes));
     // The frames before such a piece are decoded for it, back to one that stands alone.
-    const std::uint64_t longest = std::max(
-        length, std::min({count / jobs + 1, kMostBytesUncut / bytes, length + kMostLookedAt}));
-    for (std::uint64_t begin = 0; count - begin > length + length / 2;) {
-        const std::uint64_t last = std::min(begin + longest, count);
-        std::uint64_t cut = begin + length;
+    length.most = std::max(length.usual, std::min({count / jobs + 1, kMostBytesUncut / bytes,
+                                                   length.usual + kMostLookedAt}));
+    return length;
+}
+
+void FrameSource::Cut(FramePlan& plan, const FrameRange& range, unsigned jobs) {
+    const std::uint64_t count = plan.count;
+    const PieceLength length = PieceLengthFor(count, reader_->frameBytes(), jobs);
+    for (std::uint64_t begin = 0; count - begin > length.usual + length.usual / 2;) {
+        const std::uint64_t last = std::min(begin + length.most, count);
+        std::uint64_t cut = begin + length.usual;
         while (cut < last && !StandsAlone(range.first + cut * range.step)) {
             ++cut;
         }

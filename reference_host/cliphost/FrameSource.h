@@ -31,16 +31,27 @@ struct FrameForm {
 struct WantedFrames {
     FrameRange range;
     bool isOne = false;  // it names a frame, not a range
+    // There are as many as the track's length says: none is read to count them.
+    bool areBelieved = false;
 };
 
 // What is known of them once the movie is open.
 struct FramePlan {
     std::uint64_t count = 0;
+    std::uint64_t frameBytes = 0;     // as they are delivered
     std::string rawWords;             // as RawWords
     std::vector<std::uint64_t> cuts;  // where further pieces of the range begin, counted in frames
     // Nothing tells which frames stand alone: each piece is read behind those before it.
     bool isInOneGo = false;
 };
+
+// How many frames a piece of a range has, and how many at most where no frame to end before is
+// found sooner.
+struct PieceLength {
+    std::uint64_t usual = 1;
+    std::uint64_t most = 1;
+};
+PieceLength PieceLengthFor(std::uint64_t count, std::uint64_t frameBytes, unsigned jobs);
 
 // A movie whose frames are read one after the other; those of its alpha track, too, where they
 // are wanted. Throws a Failure.

@@ -51,6 +51,9 @@ int MoviesRun::Run() {
     const bool isOurs = std::any_of(steps_.begin(), steps_.end(), [](const MovieStep& step) {
         return host::system::NamesDescriptor(step.movie);
     });
+    for (const MovieStep& step : steps_) {
+        RefuseDescriptor(options_.workers, step.movie);
+    }
     const bool isForWorkers =
         options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
     if (isForWorkers) {
