@@ -23,10 +23,6 @@ using Kind = FrameRequest::Kind;
 // movie, which the plan's process has told already.
 // A movie's texts are printed without such characters.
 constexpr char kEndOfOpening = '\x01';
-// A piece that takes long lets no more than these wait on the disk, for each process; no more than
-// one, where they need more than so many bytes together.
-constexpr std::size_t kMostWaiting = 4;
-constexpr std::uint64_t kMostBytesWaiting = std::uint64_t{2} << 30;
 
 // The file of one frame, in the folder that is the child's own.
 std::filesystem::path FrameFile(const std::filesystem::path& folder, std::uint64_t number,
@@ -99,7 +95,6 @@ private:
     MadeFrame Made(std::size_t number, const std::filesystem::path& folder, std::size_t i) const;
     Problem WhyLost(std::size_t number, const WorkerResult& result) const;
     void TakeFrames(std::size_t number, const std::filesystem::path& folder);
-    std::size_t MostWaiting(const WorkerCall& call) const;
     std::filesystem::path FolderNearOutput() const;
     Problem NotWrittenIn(const std::filesystem::path& folder, std::uint64_t frame,
                          Problem problem) const;
@@ -111,6 +106,7 @@ private:
 
 void RunInPieces::WriteAll(const FramePlan& plan) {
     frameBytes_ = plan.frameBytes;
+    std::uint64_t longest = 1;
     std::vector<std::string> messages;
     for (std::size_t i = 0; i <= plan.cuts.size(); ++i) {
         const std::uint64_t begin = i == 0 ? 0 : plan.cuts[i - 1];
@@ -118,25 +114,15 @@ void RunInPieces::WriteAll(const FramePlan& plan) {
         FrameRequest piece{sink().IsRaw() ? Kind::Raw : Kind::Pictures, {}, 1, 0};
         piece.wanted.range = {NumberOf(begin), NumberOf(end - 1) + 1, wanted().range.step};
         piece.behind = NumberOf(plan.isInOneGo ? 0 : begin);
+        longest = std::max(longest, end - begin);
         requests_.push_back(piece);
         messages.push_back(piece.ToBytes());
     }
     WorkerCall call = options().workers;
     call.writeNear = FolderNearOutput();
     call.jobs = plan.isInOneGo ? 1 : call.jobs;
-    call.mostWaiting = MostWaiting(call);
+    call.mostWaiting = MostPiecesWaiting(longest, plan.frameBytes, call.jobs);
     RunInWorkers(call, messages, *this);
-}
-
-std::size_t RunInPieces::MostWaiting(const WorkerCall& call) const {
-    std::uint64_t longest = 1;
-    for (const FrameRequest& piece : requests_) {
-        longest = std::max(longest, piece.wanted.range.CountIn(*piece.wanted.range.end));
-    }
-    const std::uint64_t room =
-        kMostBytesWaiting / std::max<std::uint64_t>(frameBytes_, 1) / longest;
-    const std::size_t jobs = call.jobs;
-    return static_cast<std::size_t>(std::clamp<std::uint64_t>(room, jobs, kMostWaiting * jobs));
 }
 
 std::filesystem::path RunInPieces::FolderNearOutput() const {

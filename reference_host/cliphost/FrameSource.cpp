@@ -23,6 +23,9 @@ constexpr std::uint64_t kMostBytes = 256 * kMebibytes;
 // Of a piece that finds no frame to end before.
 constexpr std::uint64_t kMostBytesUncut = 1024 * kMebibytes;
 
+// Of pieces that wait; no process is kept waiting for that.
+constexpr std::uint64_t kMostWaitingForEach = 4;
+constexpr std::uint64_t kMostBytesWaiting = 2048 * kMebibytes;
 // So many pieces at most, whatever a header claims, and so many frames are looked at for each end.
 constexpr std::uint64_t kMostCuts = 4096;
 constexpr std::uint64_t kMostLookedAt = 4096;
@@ -101,6 +104,13 @@ PieceLength PieceLengthFor(std::uint64_t count, std::uint64_t frameBytes, unsign
     length.most = std::max(length.usual, std::min({count / jobs + 1, kMostBytesUncut / bytes,
                                                    length.usual + kMostLookedAt}));
     return length;
+}
+
+std::size_t MostPiecesWaiting(std::uint64_t frames, std::uint64_t frameBytes, unsigned jobs) {
+    const std::uint64_t bytes = std::max<std::uint64_t>(frameBytes, 1);
+    const std::uint64_t room = kMostBytesWaiting / bytes / std::max<std::uint64_t>(frames, 1);
+    const std::uint64_t least = jobs;
+    return static_cast<std::size_t>(std::clamp(room, least, kMostWaitingForEach * least));
 }
 
 void FrameSource::Cut(FramePlan& plan, const FrameRange& range, unsigned jobs) {

@@ -52,6 +52,8 @@ struct PieceLength {
     std::uint64_t most = 1;
 };
 PieceLength PieceLengthFor(std::uint64_t count, std::uint64_t frameBytes, unsigned jobs);
+// How many pieces of so many frames may be begun or wait on a disk behind one that takes long.
+std::size_t MostPiecesWaiting(std::uint64_t frames, std::uint64_t frameBytes, unsigned jobs);
 
 // A movie whose frames are read one after the other; those of its alpha track, too, where they
 // are wanted. Throws a Failure.

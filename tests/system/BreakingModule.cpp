@@ -181,7 +181,13 @@ public:
         DoHarm(HarmAt(movie_, frame), movie_);
         return provider_->ProvideSampleRange(request, flags);
     }
-    NCFRESULT Setup(ncfUInt32 track) override { return provider_->Setup(track); }
+    NCFRESULT Setup(ncfUInt32 track) override {
+        // The process that reads a range's plan has no folder.
+        if (movie_.stem() == "crash-at-setup" && !OwnFolder().empty()) {
+            DoHarm("crash", movie_);
+        }
+        return provider_->Setup(track);
+    }
     NCFRESULT ProviderUnsupportedOperation(ncfUInt32 track, ncfUInt64 a, ncfUInt64 b) override {
         return provider_->ProviderUnsupportedOperation(track, a, b);
     }

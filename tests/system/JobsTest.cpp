@@ -773,6 +773,14 @@ TEST_F(JobsOfFrames, LeaveALostPieceOutOfRawFrames) {
     EXPECT_TRUE(ReadFile(folder() / "a.raw") == rest);
 }
 
+TEST_F(JobsOfFrames, TellWhatIsToldOfTheOpeningOnce) {
+    const auto movie = Movie("crash-at-setup.mov", kProRes);
+    const CommandResult ran =
+        Harmed("-v frame " + Quoted(movie) + " --range 0:48 --jobs 2 -o " + In("pictures"));
+    ExpectSays(ran, 1, "frames 36 to 47 are left out: ");
+    EXPECT_EQ(CountOf(ran.out, "Player negotiated"), 1u) << ran.out;
+}
+
 TEST_F(JobsOfFrames, LoseAMovieThatBreaksItsFirstReader) {
     std::filesystem::copy_file(Movie("p.mov", kProRes), folder() / "in/crash.mov");
     ExpectSays(Harmed("frame " + In("in/crash.mov") + " --range 0: --jobs 2 -o " + In("a.raw")), 1,

@@ -106,6 +106,13 @@ TEST(FramePieces, AreFewWhateverAHeaderClaims) {
     EXPECT_EQ(PieceLengthFor(96, 480 * 272 * 2, 2).most, 49u);
 }
 
+TEST(FramePieces, WaitByTheirBytes) {
+    const std::uint64_t mebibyte = std::uint64_t{1} << 20;
+    EXPECT_EQ(MostPiecesWaiting(12, 1000, 8), 32u);
+    EXPECT_EQ(MostPiecesWaiting(128, mebibyte, 8), 16u);
+    EXPECT_EQ(MostPiecesWaiting(1024, mebibyte, 8), 8u) << "one for each process";
+}
+
 TEST(FrameMessages, AreNoneWhereAnyByteLacksOrIsTooMuch) {
     FrameAnswer answer;
     answer.plan = {10, 8, "words", {5}};
