@@ -51,6 +51,7 @@ int MoviesRun::Run() {
         const MovieStep step = StepAt(i);
         movies += step.IsMovie() ? 1 : 0;
         isOurs = isOurs || host::system::NamesDescriptor(step.movie);
+        RefuseDescriptor(options_.workers, step.movie);
     }
     const bool isForWorkers =
         options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
