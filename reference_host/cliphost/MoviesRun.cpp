@@ -5,19 +5,31 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <csignal>
+#include <cstdio>
 
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PrivateFile.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/OutputStream.h"
 #include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
 
 using host::DisplayPath;
+using host::system::DelayedSignals;
+
+namespace {
+
+constexpr char kStopsSoon[] =
+    "cliphost: stops after the movie at hand; interrupt it again to stop at once\n";
+
+}  // namespace
 
 template <class Work>
 void MoviesRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work& work) {
@@ -39,66 +51,110 @@ void MoviesRun::TellAlso(const Failure& failure) {
 }
 
 int MoviesRun::Run() {
+    steps_ = PlanMovies(session_, options_, ending_);
+    RefuseOneForAllOntoMovie();
+    const bool isForWorkers = IsForWorkers();
+    std::optional<DelayedSignals> signals;
+    if (isForWorkers || steps_.size() > 1) {
+        signals.emplace(isForWorkers ? nullptr : kStopsSoon);
+    }
     std::optional<OutputFolder> folder;
     if (!options_.outFolder.empty()) {
         folder.emplace(options_.outFolder);
+        LookAtMovies();
     }
-    Plan();
-    RefuseOneForAllOntoMovie();
+    if (isForWorkers) {
+        RunInChildren();
+    } else {
+        RunHere();
+    }
+    isStopped_ = signals && DelayedSignals::HaveCome();
+    Finish(done_, failed_);
+    if (isStopped_) {
+        TellStop();
+        std::fflush(stdout);  // the signal may end the program
+    }
+    return status_;
+}
+
+bool MoviesRun::IsForWorkers() const {
     const auto movies = std::count_if(steps_.begin(), steps_.end(),
                                       [](const MovieStep& step) { return step.IsMovie(); });
     // A descriptor is that of this process.
     const bool isOurs = std::any_of(steps_.begin(), steps_.end(), [](const MovieStep& step) {
         return host::system::NamesDescriptor(step.movie);
     });
-    const bool isForWorkers =
-        options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
-    if (isForWorkers) {
-        RunInChildren();
-    } else {
-        RunHere();
-    }
-    Finish(done_, failed_);
-    return status_;
+    return options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
 }
 
-void MoviesRun::Plan() {
-    for (const std::filesystem::path& path : options_.paths) {
-        std::error_code ignored;
-        if (!std::filesystem::is_directory(path, ignored)) {
-            steps_.push_back({path.native(), {}, 0, {}, {}});
+void MoviesRun::LookAtMovies() {
+    if (options_.skipDone) {
+        doneMovies_.emplace(options_.outFolder, SettingsText(session_, options_.workers.arguments));
+        for (const std::filesystem::path& file : doneMovies_->Load()) {
+            Notice("cliphost: {}: can't be read; what it tells of is done again\n",
+                   DisplayPath(file));
+        }
+    }
+    for (MovieStep& step : steps_) {
+        if (DelayedSignals::HaveCome()) {
+            return;
+        }
+        if (!step.IsMovie()) {
             continue;
         }
-        try {
-            PlanFolder(path);
-        } catch (const Failure& failure) {
-            Refuse(path, failure.status(), failure.problem());
+        step.state = host::system::StateOf(step.movie);
+        if (doneMovies_ && step.state) {
+            step.isDone = doneMovies_->Has(step.movie, *step.state,
+                                           OutputName(step.movie, step.number, ending_));
+            doneBefore_ += step.isDone ? 1 : 0;
         }
     }
 }
 
-void MoviesRun::PlanFolder(const std::filesystem::path& folder) {
-    const auto path = PathForModule(folder);
-    if (!IsClaimed(session_, path.get())) {
-        throw Failure(kExitFile, NotClaimed(folder));
+void MoviesRun::Remember(const MovieStep& step, const std::filesystem::path& saved) {
+    if (options_.outFolder.empty() || !step.state) {
+        return;
     }
-    const auto clips = std::make_shared<const FolderClips>(session_, folder);
-    for (const std::filesystem::path& name : clips->others().withBackslash) {
-        Refuse(name, kExitCaller, BackslashProblem(name));
-    }
-    for (const Problem& problem : clips->others().noFiles) {
-        Refuse(problem.subject, kExitCaller, problem);
-    }
-    if (const Problem leftOut = LeftOut(folder, clips->others())) {
-        steps_.push_back({folder.native(), {}, 0, {}, std::make_shared<const Problem>(leftOut)});
-    }
-    for (const FolderClip& clip : clips->clips()) {
-        steps_.push_back({clip.path, clips, clip.index, {}, {}});
+    if (options_.skipDone) {
+        Record(step, saved.filename(), DoneMovies::Known::ByContent);
+    } else {
+        outputs_.emplace_back(&step, saved.filename());
     }
 }
 
-void MoviesRun::Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
-    steps_.push_back({path.native(), {}, 0, std::make_shared<const Failure>(status, problem), {}});
+void MoviesRun::Record(const MovieStep& step, const std::filesystem::path& output,
+                       DoneMovies::Known known) {
+    if (!canRecord_) {
+        return;
+    }
+    try {
+        if (!doneMovies_) {
+            doneMovies_.emplace(options_.outFolder,
+                                SettingsText(session_, options_.workers.arguments));
+        }
+        doneMovies_->Add(step.movie, *step.state, output, known);
+    } catch (const Failure& failure) {
+        canRecord_ = false;
+        TellAlso(failure);
+    }
+}
+
+void MoviesRun::TellStop() {
+    const auto all = std::count_if(steps_.begin(), steps_.end(),
+                                   [](const MovieStep& step) { return !step.notice; });
+    const int signal = DelayedSignals::Which();
+    std::string goesOn;
+    // Those that keep no record from the start keep one for the next run.
+    if (!options_.outFolder.empty() && signal != SIGPIPE) {
+        for (const auto& [step, output] : outputs_) {
+            Record(*step, output, DoneMovies::Known::ByDate);
+        }
+        goesOn = canRecord_ ? "; the same call with --skip-done goes on" : "";
+    }
+    const int done = done_ + doneBefore_;
+    Notice("cliphost: stopped by signal {}: {} of {} done, {} failed, {} left{}\n", signal, done,
+           Counted(static_cast<std::uint64_t>(all), "movie"), failed_, all - done - failed_,
+           goesOn);
 }
 
 // It is written when all movies were read: none of them may be there.
@@ -115,6 +171,9 @@ void MoviesRun::RunHere() {
         progress_.emplace(doing_, steps_.size());
     }
     for (const MovieStep& step : steps_) {
+        if (DelayedSignals::HaveCome()) {
+            break;
+        }
         if (progress_) {
             progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
         }
@@ -125,10 +184,10 @@ void MoviesRun::RunHere() {
         GoOnAfterFailure(step.movie, [&] {
             std::filesystem::path saved;
             const MovieAnswer answer = Answer(step, [&] {
-                saved = options_.Saves() ? TargetFor(step.movie) : std::filesystem::path();
+                saved = options_.Saves() ? TargetFor(step) : std::filesystem::path();
                 return saved;
             });
-            Settle(step.movie, answer, options_.together.empty() ? saved : options_.together);
+            Settle(step, answer, options_.together.empty() ? saved : options_.together);
         });
     }
     progress_.reset();
@@ -164,7 +223,9 @@ void MoviesRun::RunInChildren() {
     progress_.emplace(doing_, requests.size());
     RunInWorkers(call, requests, *this);
     progress_.reset();
-    TellThoseBefore(steps_.size());
+    if (!DelayedSignals::HaveCome()) {
+        TellThoseBefore(steps_.size());
+    }
 }
 
 void MoviesRun::TellThoseBefore(std::size_t place) {
@@ -203,62 +264,74 @@ void MoviesRun::Deliver(const MovieStep& step, std::size_t number, const WorkerR
         const std::filesystem::path file = PrivateFile(result.folder, number);
         const bool isSaved = answer.status == kExitFine;
         const bool isNotSaved = !isSaved && answer.problem.subject == file;
-        saved = isSaved || isNotSaved ? TargetFor(step.movie) : saved;
+        saved = isSaved || isNotSaved ? TargetFor(step) : saved;
         if (isNotSaved) {
             answer.problem.subject = saved;
         } else if (isSaved) {
             PutIntoPlace(file, saved);
         }
     }
-    Settle(step.movie, answer, saved);
+    Settle(step, answer, saved);
 }
 
 void MoviesRun::TellInstead(const MovieStep& step) {
-    if (step.notice) {
+    if (step.isDone) {
+        if (session_.verbosity() > 0) {
+            Notice("cliphost: {}: is done already\n",
+                   DisplayPath(std::filesystem::path(step.movie)));
+        }
+        ShowDone(step.movie, options_.outFolder / OutputName(step.movie, step.number, ending_));
+    } else if (step.notice) {
         TellProblem(*step.notice, session_.verbosity());
     } else {
         GoOnAfterFailure(step.movie, [&] { throw *step.refusal; });
     }
 }
 
-void MoviesRun::Settle(const std::filesystem::path& movie, const MovieAnswer& answer,
+void MoviesRun::Settle(const MovieStep& step, const MovieAnswer& answer,
                        const std::filesystem::path& saved) {
     if (answer.status != kExitFine) {
         throw Failure(answer.status, answer.problem);
     }
     ++done_;
+    // What lacks something is made again each time, and told.
+    if (!answer.isPartial) {
+        Remember(step, saved);
+    }
     status_ = std::max(status_, answer.isPartial ? kExitFile : kExitFine);
-    Show(movie, answer, saved);
+    Show(step.movie, answer, saved);
 }
 
-// The paths of the command line by the files that they name.
-const MoviesRun::PathsByFile& MoviesRun::Given() {
-    if (given_.empty()) {
-        for (const std::filesystem::path& path : options_.paths) {
-            if (const auto number = host::system::NumberOf(path)) {
-                given_.emplace(*number, &path);
+// The steps that the caller named by the files that they are.
+const MoviesRun::StepsByFile& MoviesRun::Named() {
+    if (named_.empty()) {
+        for (const MovieStep& step : steps_) {
+            const auto number = step.isNamed ? host::system::NumberOf(step.movie) : std::nullopt;
+            if (number) {
+                named_.emplace(*number, &step);
             }
         }
     }
-    return given_;
+    return named_;
 }
 
-std::filesystem::path MoviesRun::TargetFor(const std::filesystem::path& movie) {
+std::filesystem::path MoviesRun::TargetFor(const MovieStep& step) {
     std::filesystem::path target = options_.file;
-    // Movies of one name in different folders get numbers.
-    for (int number = 1; target.empty(); ++number) {
-        std::filesystem::path name = movie.stem();
-        name += number == 1 ? ending_ : fmt::format("-{}{}", number, ending_);
-        const std::filesystem::path free = options_.outFolder / name;
+    if (step.number != 0) {
+        target = options_.outFolder / OutputName(step.movie, step.number, ending_);
+    }
+    for (unsigned number = 1; target.empty(); ++number) {
+        const std::filesystem::path free =
+            options_.outFolder / OutputName(step.movie, number, ending_);
         if (targetsTaken_.insert(free).second) {
             target = free;
         }
     }
     const auto inItsPlace = host::system::NumberOf(target);
     if (inItsPlace) {
-        RefuseOutputOntoMovie(target, movie);
-        if (const auto other = Given().find(*inItsPlace); other != Given().end()) {
-            RefuseOutputOntoMovie(target, *other->second);
+        RefuseOutputOntoMovie(target, step.movie);
+        if (const auto other = Named().find(*inItsPlace); other != Named().end()) {
+            RefuseOutputOntoMovie(target, other->second->movie);
         }
     }
     return target;
