@@ -45,6 +45,11 @@ std::string DigestTextOfFile(const std::filesystem::path& file) {
     return digest ? TextOf(*digest) : "none";
 }
 
+[[noreturn]] void FailToKeep(Problem problem) {
+    problem.hint = "--skip-done will not find the outputs of this run";
+    throw Failure(kExitCaller, std::move(problem));
+}
+
 // The same path for all runs, wherever they are started.
 std::string KeptPath(const std::filesystem::path& movie) {
     std::error_code error;
@@ -163,12 +168,12 @@ void DoneMovies::Begin() {
     std::error_code error;
     std::filesystem::create_directory(folder, error);
     if (error) {
-        throw Failure(kExitCaller, FolderNotMade(folder, error.value()));
+        FailToKeep(FolderNotMade(folder, error.value()));
     }
     std::random_device random;
     written_ = folder / fmt::format("{:08x}{:08x}{}", random(), random(), kEnding);
     if (const int failed = stream_.Open(written_)) {
-        throw Failure(kExitCaller, NotWritten(written_, failed));
+        FailToKeep(NotWritten(written_, failed));
     }
 }
 
@@ -192,7 +197,7 @@ void DoneMovies::Add(const std::filesystem::path& movie, const FileState& state,
     // At once, so that no other line gets into it.
     const std::string text = line.dump() + '\n';
     if (const int failed = stream_.Write(text.data(), text.size())) {
-        throw Failure(kExitCaller, NotWritten(written_, failed));
+        FailToKeep(NotWritten(written_, failed));
     }
 }
 

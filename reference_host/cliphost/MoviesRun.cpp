@@ -140,21 +140,20 @@ void MoviesRun::Record(const MovieStep& step, const std::filesystem::path& outpu
 }
 
 void MoviesRun::TellStop() {
+    if (DelayedSignals::Which() == SIGPIPE) {
+        return;  // who reads what is printed has seen enough
+    }
+    // A run that keeps no record from the start keeps one for the next.
+    for (const auto& [step, output] : outputs_) {
+        Record(*step, output, DoneMovies::Known::ByDate);
+    }
+    const bool goesOn = !options_.outFolder.empty() && canRecord_;
     const auto all = std::count_if(steps_.begin(), steps_.end(),
                                    [](const MovieStep& step) { return !step.notice; });
-    const int signal = DelayedSignals::Which();
-    std::string goesOn;
-    // Those that keep no record from the start keep one for the next run.
-    if (!options_.outFolder.empty() && signal != SIGPIPE) {
-        for (const auto& [step, output] : outputs_) {
-            Record(*step, output, DoneMovies::Known::ByDate);
-        }
-        goesOn = canRecord_ ? "; the same call with --skip-done goes on" : "";
-    }
     const int done = done_ + doneBefore_;
-    Notice("cliphost: stopped by signal {}: {} of {} done, {} failed, {} left{}\n", signal, done,
-           Counted(static_cast<std::uint64_t>(all), "movie"), failed_, all - done - failed_,
-           goesOn);
+    Notice("cliphost: stopped by signal {}: {} of {} done, {} failed, {} left{}\n",
+           DelayedSignals::Which(), done, Counted(static_cast<std::uint64_t>(all), "movie"),
+           failed_, all - done - failed_, goesOn ? "; the same call with --skip-done goes on" : "");
 }
 
 // It is written when all movies were read: none of them may be there.

@@ -31,7 +31,9 @@ extern "C" void NoteSignal(int signal) {
     } else if (noted == 0) {
         notedAt = std::time(nullptr);
         noted = signal;
-        if (line != nullptr && write(STDERR_FILENO, line, std::strlen(line)) < 0) {
+        // Who closed a pipe has had enough.
+        if (line != nullptr && signal != SIGPIPE &&
+            write(STDERR_FILENO, line, std::strlen(line)) < 0) {
             // Nobody is there to read it.
         }
     }
@@ -67,7 +69,11 @@ DelayedSignals::~DelayedSignals() {
         return;
     }
     for (const Before& before : before_) {
-        sigaction(before.signal, &before.action, nullptr);
+        struct sigaction present {};
+        // What somebody has settled since then stays.
+        if (sigaction(before.signal, nullptr, &present) == 0 && present.sa_handler == NoteSignal) {
+            sigaction(before.signal, &before.action, nullptr);
+        }
     }
     if (noted != 0) {
         std::raise(noted);
