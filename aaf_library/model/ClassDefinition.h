@@ -38,6 +38,8 @@ public:
     PropertyDefinition* FindProperty(const GUID& id);
     PropertyDefinition* FindProperty(PropertyId pid);
     PropertyDefinition* FindUniqueProperty();
+    // Those that its objects must have, and the one with that id if it is among the others.
+    std::vector<PropertyDefinition*> RequiredProperties(const GUID& andThis);
     // Adds without the checks that a caller's registration has. pid kNoPropertyId: the next free.
     PropertyDefinition& AddProperty(const GUID& id, const std::wstring& name, const GUID& typeId,
                                     bool optional, bool unique, PropertyId pid = kNoPropertyId);
@@ -77,11 +79,16 @@ private:
     HRESULT RegisterProperty(const GUID& id, aafCharacter_constptr name, IAAFTypeDef* typeDef,
                              bool optional, bool unique, IAAFPropertyDef** propDef);
 
+    void Cover(PropertyId pid);
+
     ClassDefinition* parent_ = nullptr;
     bool concrete_ = false;
     bool registered_ = false;
     Span<BuiltInProperty> builtIn_;
     std::vector<RefPtr<PropertyDefinition>> properties_;  // null: not looked up yet
+    // No property of its own has a number beyond these.
+    PropertyId lowest_ = 0xFFFF;
+    PropertyId highest_ = 0;
 };
 
 }  // namespace aaf

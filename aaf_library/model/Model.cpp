@@ -49,6 +49,18 @@ Model::~Model() {
     }
 }
 
+void Model::LetGo(const Copier& copier) {
+    waiting_.erase(std::remove(waiting_.begin(), waiting_.end(), &copier), waiting_.end());
+}
+
+void Model::CallWaiting() {
+    while (!waiting_.empty()) {
+        Copier* const copier = waiting_.back();
+        waiting_.pop_back();
+        copier->CopyNow();
+    }
+}
+
 void Model::Release() {
     if (--pins_ == 0 && !dying_) {
         dying_ = true;
@@ -116,10 +128,13 @@ RefPtr<Object> Model::CreateObject(ClassDefinition& definition, bool withDefault
 }
 
 RefPtr<PropertyValue> Model::NewValue(TypeDefinition& type) {
+    return NewValue(type, type.EmptyBytes());
+}
+
+RefPtr<PropertyValue> Model::NewValue(TypeDefinition& type, Bytes bytes) {
     KeepType(type);
-    RefPtr<PropertyValue> value(new PropertyValue(type));
+    RefPtr<PropertyValue> value(new PropertyValue(type, std::move(bytes)));
     value->JoinModel(*this);
-    type.FillEmpty(*value);
     return value;
 }
 
@@ -285,6 +300,9 @@ PropertyId Model::EnterProperty(PropertyDefinition& property) {
 }
 
 void Model::ForgetProperty(PropertyDefinition& property) {
+    if (dying_) {
+        return;
+    }
     const auto found = propertyById_.find(property.id());
     if (found != propertyById_.end() && found->second == &property) {
         propertyById_.erase(found);

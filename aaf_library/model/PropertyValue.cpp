@@ -4,6 +4,7 @@
 
 #include <algorithm>
 
+#include "aaf_library/model/Model.h"
 #include "aaf_library/model/Object.h"
 #include "aaf_library/model/TypeDefinition.h"
 
@@ -21,7 +22,8 @@ bool IsWithin(const Object* candidate, const Object* holder) {
 
 }  // namespace
 
-PropertyValue::PropertyValue(TypeDefinition& type) : type_(&type) {}
+PropertyValue::PropertyValue(TypeDefinition& type, Bytes bytes)
+    : type_(&type), bytes_(std::move(bytes)) {}
 
 // The holder takes its values out before it lets them go, so none is left here.
 PropertyValue::~PropertyValue() = default;
@@ -46,8 +48,16 @@ void PropertyValue::Detach(Object& object) {
 
 void PropertyValue::TellHolder() {
     if (holder_ != nullptr) {
+        model()->TellChange();
         holder_->OnValueChange(*this);
     }
+}
+
+void PropertyValue::SetStreamByteOrder(std::uint8_t order) {
+    if (holder_ != nullptr) {
+        model()->TellChange();
+    }
+    streamByteOrder_ = order;
 }
 
 HRESULT PropertyValue::InsertObject(std::size_t index, Object* object) {
@@ -71,6 +81,8 @@ HRESULT PropertyValue::InsertObject(std::size_t index, Object* object) {
     }
     if (index < objects_.size()) {
         TellHolder();
+    } else if (holder_ != nullptr) {
+        model()->TellChange();
     }
     index = std::min(index, objects_.size());
     objects_.insert(objects_.begin() + static_cast<std::ptrdiff_t>(index), RefPtr<Object>(object));

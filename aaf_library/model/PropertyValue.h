@@ -26,9 +26,9 @@ using Bytes = std::vector<std::uint8_t>;
 // The value that stands in an object is the very one that was set on it, so a
 // caller who holds it sees and makes changes of the object. The objects that it
 // contains then belong to that object.
-class PropertyValue : public Implements<Unknown, IAAFPropertyValue> {
+class PropertyValue final : public Implements<Unknown, IAAFPropertyValue> {
 public:
-    explicit PropertyValue(TypeDefinition& type);
+    PropertyValue(TypeDefinition& type, Bytes bytes);
 
     TypeDefinition& type() const { return *type_; }
     bool HoldsObjects() const;
@@ -60,16 +60,14 @@ public:
     void SetPosition(std::uint64_t position) { position_ = position; }
     // Byte order mark of a stream: 0x55 unspecified, 0x4C little, 0x42 big.
     std::uint8_t streamByteOrder() const { return streamByteOrder_; }
-    void SetStreamByteOrder(std::uint8_t order) { streamByteOrder_ = order; }
+    void SetStreamByteOrder(std::uint8_t order);
 
     // -- IAAFPropertyValue
     HRESULT GetType(IAAFTypeDef** typeDef) override;
     HRESULT IsDefinedType(aafBoolean_t* isDefined) override;
 
-protected:
-    ~PropertyValue() override;
-
 private:
+    ~PropertyValue() override;
     static void Attach(Object& object, Object& owner);
     static void Detach(Object& object);
     void TellHolder();

@@ -24,17 +24,24 @@ std::string NamesInWords(const std::vector<std::string>& endings) {
     return words;
 }
 
-class Planner {
+}  // namespace
+
+class MoviePlanner {
 public:
-    Planner(Session& session, const MoviesOptions& options)
-        : session_(session), options_(options) {}
+    MoviePlanner(Session& session, const MoviesOptions& options, const char* ending,
+                 MoviePlan& plan)
+        : session_(session),
+          options_(options),
+          ending_(ending),
+          plan_(plan),
+          hasNumbers_(!options.outFolder.empty() &&
+                      (options.skipDone || !options.shard.IsWhole())) {}
 
     void Add(const std::filesystem::path& path) {
         std::error_code ignored;
         if (!std::filesystem::is_directory(path, ignored)) {
-            MovieStep step{path.native()};
-            step.isNamed = true;
-            Append(std::move(step), path);
+            AppendMovie(path, path, MoviePlan::kNamed,
+                        [&] { return Keep(path.native(), plan_.named_); });
         } else if (options_.isRecursive) {
             AddTree(path);
         } else {
@@ -42,43 +49,55 @@ public:
         }
     }
 
-    void NumberOutputs(const char* ending) {
-        std::unordered_set<std::string> taken;
-        std::unordered_map<std::string, unsigned> last;  // by the name without a number
-        for (MovieStep& step : steps_) {
-            if (step.IsMovie()) {
-                unsigned& number = last[OutputName(step.movie, 1, ending)];
-                while (!taken.insert(OutputName(step.movie, ++number, ending)).second) {
-                }
-                step.number = number;
-            }
-        }
-    }
-
-    // Those of other shares are left out.
-    std::vector<MovieStep> TakeShare() {
-        std::size_t count = 0;
-        for (std::size_t i = 0; i < steps_.size(); ++i) {
-            if (isOfShare_[i] && count++ != i) {
-                steps_[count - 1] = std::move(steps_[i]);
-            }
-        }
-        steps_.resize(count);
-        return std::move(steps_);
-    }
-
 private:
+    static std::uint32_t Keep(const std::string& path, PathList& paths) {
+        paths.Add(path);
+        return static_cast<std::uint32_t>(paths.size() - 1);
+    }
+
     // `asGiven` does not depend on where the caller's working folder is mounted.
-    void Append(MovieStep step, const std::filesystem::path& asGiven) {
-        steps_.push_back(std::move(step));
-        isOfShare_.push_back(options_.shard.IsWhole() ||
-                             options_.shard.Holds(asGiven.lexically_normal()));
+    bool IsOfShare(const std::filesystem::path& asGiven) const {
+        return options_.shard.IsWhole() || options_.shard.Holds(asGiven.lexically_normal());
+    }
+
+    template <class Place>
+    void AppendMovie(const std::filesystem::path& movie, const std::filesystem::path& asGiven,
+                     std::uint32_t list, const Place& place) {
+        isEmpty_ = false;
+        const unsigned number = hasNumbers_ ? NextNumber(movie) : 0;
+        if (IsOfShare(asGiven)) {
+            plan_.steps_.push_back({list, place()});
+            AppendNumber(number);
+        }
+    }
+
+    void AppendOther(MovieStep step) {
+        isEmpty_ = isEmpty_ && step.notice;
+        if (IsOfShare(step.movie)) {
+            plan_.steps_.push_back(
+                {MoviePlan::kOther, static_cast<std::uint32_t>(plan_.others_.size())});
+            plan_.others_.push_back(std::move(step));
+            AppendNumber(0);
+        }
+    }
+
+    void AppendNumber(unsigned number) {
+        if (hasNumbers_) {
+            plan_.numbers_.push_back(number);
+        }
+    }
+
+    unsigned NextNumber(const std::filesystem::path& movie) {
+        unsigned& number = lastNumbers_[OutputName(movie, 1, ending_)];
+        while (!names_.insert(OutputName(movie, ++number, ending_)).second) {
+        }
+        return number;
     }
 
     void Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
         MovieStep step{path.native()};
         step.refusal = std::make_shared<const Failure>(status, problem);
-        Append(std::move(step), path);
+        AppendOther(std::move(step));
     }
 
     void Refuse(const std::vector<Problem>& problems) {
@@ -88,18 +107,15 @@ private:
     }
 
     void AddTree(const std::filesystem::path& root) {
-        const std::size_t before = steps_.size();
+        isEmpty_ = true;
         for (const std::filesystem::path& folder : FoldersIn(root)) {
             AddFolder(folder, true);
         }
-        for (std::size_t i = before; i < steps_.size(); ++i) {
-            if (!steps_[i].notice) {
-                return;
-            }
+        if (isEmpty_) {
+            Refuse(root, kExitFile,
+                   {root, fmt::format("no file in it or in a folder within it is named {}",
+                                      NamesInWords(options_.endings))});
         }
-        Refuse(root, kExitFile,
-               {root, fmt::format("no file in it or in a folder within it is named {}",
-                                  NamesInWords(options_.endings))});
     }
 
     void AddFolder(const std::filesystem::path& folder, bool isOneOfMany) {
@@ -119,17 +135,17 @@ private:
     }
 
     void AddClaimed(const std::filesystem::path& folder) {
-        const auto clips = std::make_shared<const FolderClips>(session_, folder);
+        const auto clips = std::make_shared<FolderClips>(session_, folder);
         for (const std::filesystem::path& name : clips->others().withBackslash) {
             Refuse(name, kExitCaller, BackslashProblem(name));
         }
         Refuse(clips->others().noFiles);
         TellLeftOut(folder, clips->others());
-        for (const FolderClip& clip : clips->clips()) {
-            MovieStep step{clip.path};
-            step.folder = clips;
-            step.index = clip.index;
-            Append(std::move(step), folder / std::filesystem::path(clip.path).filename());
+        const auto list = static_cast<std::uint32_t>(plan_.folders_.size());
+        plan_.folders_.push_back(clips);
+        for (std::uint32_t place = 0; place < clips->clips().size(); ++place) {
+            const std::filesystem::path movie = clips->clips()[place].path;
+            AppendMovie(movie, folder / movie.filename(), list, [&] { return place; });
         }
     }
 
@@ -143,7 +159,7 @@ private:
         if (const Problem leftOut = LeftOut(folder, others)) {
             MovieStep step{folder.native()};
             step.notice = std::make_shared<const Problem>(leftOut);
-            Append(std::move(step), folder);
+            AppendOther(std::move(step));
         }
     }
 
@@ -152,8 +168,9 @@ private:
         Refuse(matches.noFiles);
         for (const std::filesystem::path& file : matches.files) {
             // The form of the paths that the module lists.
-            MovieStep step{std::filesystem::absolute(file).lexically_normal().native()};
-            Append(std::move(step), file);
+            const auto movie = std::filesystem::absolute(file).lexically_normal();
+            AppendMovie(movie, file, MoviePlan::kFound,
+                        [&] { return Keep(movie.native(), plan_.found_); });
         }
         if (!isOneOfMany && matches.noFiles.empty() && matches.files.empty()) {
             throw Failure(kExitFile, folder,
@@ -163,15 +180,16 @@ private:
 
     Session& session_;
     const MoviesOptions& options_;
-    std::vector<MovieStep> steps_;
-    std::vector<bool> isOfShare_;
+    const char* const ending_;
+    MoviePlan& plan_;
+    const bool hasNumbers_;
+    std::unordered_set<std::string> names_;                  // of outputs
+    std::unordered_map<std::string, unsigned> lastNumbers_;  // by the name without one
+    bool isEmpty_ = true;  // the folder has neither a movie nor what is told as one
 };
 
-}  // namespace
-
-std::vector<MovieStep> PlanMovies(Session& session, const MoviesOptions& options,
-                                  const char* ending) {
-    Planner planner(session, options);
+MoviePlan::MoviePlan(Session& session, const MoviesOptions& options, const char* ending) {
+    MoviePlanner planner(session, options, ending, *this);
     for (const std::filesystem::path& path : options.paths) {
         planner.Add(path);
     }
@@ -180,11 +198,31 @@ std::vector<MovieStep> PlanMovies(Session& session, const MoviesOptions& options
             planner.Add(path);
         }
     }
-    // Names that are the same in every run and on every machine.
-    if (!options.outFolder.empty() && (options.skipDone || !options.shard.IsWhole())) {
-        planner.NumberOutputs(ending);
+    named_.Close();
+    found_.Close();
+}
+
+MovieStep MoviePlan::operator[](std::size_t place) const {
+    const Planned& planned = steps_[place];
+    switch (planned.list) {
+        case kOther:
+            return others_[planned.place];
+        case kNamed:
+            return {named_[planned.place]};
+        case kFound:
+            return {found_[planned.place]};
+        default: {
+            const std::shared_ptr<FolderClips>& folder = folders_[planned.list];
+            FolderClip clip = folder->clips()[planned.place];
+            return {std::move(clip.path), folder, clip.index};
+        }
     }
-    return planner.TakeShare();
+}
+
+void MoviePlan::EndLists() {
+    for (const std::shared_ptr<FolderClips>& folder : folders_) {
+        folder->EndList();
+    }
 }
 
 std::filesystem::path OutputName(const std::filesystem::path& movie, unsigned number,

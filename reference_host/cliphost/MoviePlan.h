@@ -2,18 +2,18 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <memory>
-#include <optional>
 #include <string>
 #include <vector>
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/InputList.h"
+#include "reference_host/cliphost/PathList.h"
 #include "reference_host/cliphost/Shard.h"
 #include "reference_host/cliphost/Workers.h"
-#include "reference_host/system/FileState.h"
 
 namespace cliphost {
 
@@ -40,18 +40,47 @@ struct MovieStep {
     ncfSInt32 index = 0;                             // in that
     std::shared_ptr<const Failure> refusal = {};     // it can't be asked for
     std::shared_ptr<const Problem> notice = {};      // no movie is meant
-    bool isNamed = false;                            // by the caller, not by a folder
-    unsigned number = 0;                             // in its output's name; 0: whichever is free
-    bool isDone = false;                             // its output is there already
-    std::optional<host::system::FileState> state = {};  // before it was read
 
-    bool IsMovie() const { return !refusal && !notice && !isDone; }
+    bool IsMovie() const { return !refusal && !notice; }
 };
 
-// The steps for what the command line names, in its order; folders are listed through the module.
-// `ending` is that of the outputs. Throws a Failure for a list that can't be read.
-std::vector<MovieStep> PlanMovies(Session& session, const MoviesOptions& options,
-                                  const char* ending);
+// What the command line names, in its order; folders are listed through the module. There may be
+// a million movies: of each only its name is kept, and its folder once.
+class MoviePlan {
+public:
+    // Where outputs need the same name in every run and on every machine, each movie has a number
+    // in its output's name: the place among all movies of that name, those of other shares too.
+    // `ending` is that of the outputs. Throws a Failure for a list that can't be read.
+    MoviePlan(Session& session, const MoviesOptions& options, const char* ending);
+
+    // Steps of other shares are not among them.
+    std::size_t size() const { return steps_.size(); }
+    MovieStep operator[](std::size_t place) const;
+    // Whether the caller named it, not a folder.
+    bool IsNamed(std::size_t place) const { return steps_[place].list == kNamed; }
+    // 0: whichever is free.
+    unsigned NumberOf(std::size_t place) const { return numbers_.empty() ? 0 : numbers_[place]; }
+
+    // The module's lists end; what they said stays.
+    void EndLists();
+
+private:
+    struct Planned {
+        std::uint32_t list;   // among the folders, or one of those below
+        std::uint32_t place;  // among its movies
+    };
+    static constexpr std::uint32_t kOther = 0xFFFFFFFF;
+    static constexpr std::uint32_t kNamed = kOther - 1;
+    static constexpr std::uint32_t kFound = kOther - 2;  // in a folder, by its ending
+    friend class MoviePlanner;
+
+    std::vector<Planned> steps_;
+    std::vector<unsigned> numbers_;  // of these, or none
+    std::vector<std::shared_ptr<FolderClips>> folders_;
+    PathList named_;
+    PathList found_;
+    std::vector<MovieStep> others_;
+};
 
 // The name of what is made of a movie. Movies of one name in different folders have numbers.
 std::filesystem::path OutputName(const std::filesystem::path& movie, unsigned number,

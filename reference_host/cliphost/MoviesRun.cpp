@@ -51,11 +51,11 @@ void MoviesRun::TellAlso(const Failure& failure) {
 }
 
 int MoviesRun::Run() {
-    steps_ = PlanMovies(session_, options_, ending_);
+    plan_.emplace(session_, options_, ending_);
     RefuseOneForAllOntoMovie();
     const bool isForWorkers = IsForWorkers();
     std::optional<DelayedSignals> signals;
-    if (isForWorkers || steps_.size() > 1) {
+    if (isForWorkers || plan().size() > 1) {
         signals.emplace(isForWorkers ? nullptr : kStopsSoon);
     }
     std::optional<OutputFolder> folder;
@@ -78,12 +78,13 @@ int MoviesRun::Run() {
 }
 
 bool MoviesRun::IsForWorkers() const {
-    const auto movies = std::count_if(steps_.begin(), steps_.end(),
-                                      [](const MovieStep& step) { return step.IsMovie(); });
-    // A descriptor is that of this process.
-    const bool isOurs = std::any_of(steps_.begin(), steps_.end(), [](const MovieStep& step) {
-        return host::system::NamesDescriptor(step.movie);
-    });
+    std::size_t movies = 0;
+    bool isOurs = false;  // a descriptor is that of this process
+    for (std::size_t i = 0; i < plan().size(); ++i) {
+        const MovieStep step = plan()[i];
+        movies += step.IsMovie() ? 1 : 0;
+        isOurs = isOurs || host::system::NamesDescriptor(step.movie);
+    }
     return options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
 }
 
@@ -95,35 +96,36 @@ void MoviesRun::LookAtMovies() {
                    DisplayPath(file));
         }
     }
-    for (MovieStep& step : steps_) {
-        if (DelayedSignals::HaveCome()) {
-            return;
-        }
+    looks_.resize(plan().size());
+    for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
+        const MovieStep step = plan()[i];
         if (!step.IsMovie()) {
             continue;
         }
-        step.state = host::system::StateOf(step.movie);
-        if (doneMovies_ && step.state) {
-            step.isDone = doneMovies_->Has(step.movie, *step.state,
-                                           OutputName(step.movie, step.number, ending_));
-            doneBefore_ += step.isDone ? 1 : 0;
+        Look& look = looks_[i];
+        look.state = host::system::StateOf(step.movie);
+        if (doneMovies_ && look.state) {
+            const auto output = OutputName(step.movie, plan().NumberOf(i), ending_);
+            look.isDone = doneMovies_->Has(step.movie, *look.state, output);
+            doneBefore_ += look.isDone ? 1 : 0;
         }
     }
 }
 
-void MoviesRun::Remember(const MovieStep& step, const std::filesystem::path& saved) {
-    if (options_.outFolder.empty() || !step.state) {
+void MoviesRun::Remember(std::size_t place, const MovieStep& step,
+                         const std::filesystem::path& saved) {
+    if (looks_.empty() || !looks_[place].state) {
         return;
     }
     if (options_.skipDone) {
-        Record(step, saved.filename(), DoneMovies::Known::ByContent);
+        Record(place, step, saved.filename(), DoneMovies::Known::ByContent);
     } else {
-        outputs_.emplace_back(&step, saved.filename());
+        outputs_.emplace_back(static_cast<std::uint32_t>(place), saved.filename());
     }
 }
 
-void MoviesRun::Record(const MovieStep& step, const std::filesystem::path& output,
-                       DoneMovies::Known known) {
+void MoviesRun::Record(std::size_t place, const MovieStep& step,
+                       const std::filesystem::path& output, DoneMovies::Known known) {
     if (!canRecord_) {
         return;
     }
@@ -132,7 +134,7 @@ void MoviesRun::Record(const MovieStep& step, const std::filesystem::path& outpu
             doneMovies_.emplace(options_.outFolder,
                                 SettingsText(session_, options_.workers.arguments));
         }
-        doneMovies_->Add(step.movie, *step.state, output, known);
+        doneMovies_->Add(step.movie, *looks_[place].state, output, known);
     } catch (const Failure& failure) {
         canRecord_ = false;
         TellAlso(failure);
@@ -144,12 +146,14 @@ void MoviesRun::TellStop() {
         return;  // who reads what is printed has seen enough
     }
     // A run that keeps no record from the start keeps one for the next.
-    for (const auto& [step, output] : outputs_) {
-        Record(*step, output, DoneMovies::Known::ByDate);
+    for (const auto& [place, output] : outputs_) {
+        Record(place, plan()[place], output, DoneMovies::Known::ByDate);
     }
     const bool goesOn = !options_.outFolder.empty() && canRecord_;
-    const auto all = std::count_if(steps_.begin(), steps_.end(),
-                                   [](const MovieStep& step) { return !step.notice; });
+    int all = 0;
+    for (std::size_t i = 0; i < plan().size(); ++i) {
+        all += plan()[i].notice ? 0 : 1;
+    }
     const int done = done_ + doneBefore_;
     Notice("cliphost: stopped by signal {}: {} of {} done, {} failed, {} left{}\n",
            DelayedSignals::Which(), done, Counted(static_cast<std::uint64_t>(all), "movie"),
@@ -159,34 +163,32 @@ void MoviesRun::TellStop() {
 // It is written when all movies were read: none of them may be there.
 void MoviesRun::RefuseOneForAllOntoMovie() const {
     if (!options_.together.empty() && host::system::NumberOf(options_.together)) {
-        for (const MovieStep& step : steps_) {
-            RefuseOutputOntoMovie(options_.together, step.movie);
+        for (std::size_t i = 0; i < plan().size(); ++i) {
+            RefuseOutputOntoMovie(options_.together, plan()[i].movie);
         }
     }
 }
 
 void MoviesRun::RunHere() {
-    if (steps_.size() > 1) {
-        progress_.emplace(doing_, steps_.size());
+    if (plan().size() > 1) {
+        progress_.emplace(doing_, plan().size());
     }
-    for (const MovieStep& step : steps_) {
-        if (DelayedSignals::HaveCome()) {
-            break;
-        }
+    for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
+        const MovieStep step = plan()[i];
         if (progress_) {
             progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
         }
-        if (!step.IsMovie()) {
-            TellInstead(step);
+        if (!IsToDo(i)) {
+            TellInstead(i);
             continue;
         }
         GoOnAfterFailure(step.movie, [&] {
             std::filesystem::path saved;
             const MovieAnswer answer = Answer(step, [&] {
-                saved = options_.Saves() ? TargetFor(step) : std::filesystem::path();
+                saved = options_.Saves() ? TargetFor(i, step) : std::filesystem::path();
                 return saved;
             });
-            Settle(step, answer, options_.together.empty() ? saved : options_.together);
+            Settle(i, step, answer, options_.together.empty() ? saved : options_.together);
         });
     }
     progress_.reset();
@@ -205,31 +207,33 @@ std::filesystem::path MoviesRun::PlaceToWrite() const {
 }
 
 void MoviesRun::RunInChildren() {
-    std::vector<std::string> requests;
-    for (std::size_t i = 0; i < steps_.size(); ++i) {
-        if (steps_[i].IsMovie()) {
-            steps_[i].folder.reset();
-            requests.push_back(steps_[i].movie);
-            placesOfRequests_.push_back(i);
+    for (std::size_t i = 0; i < plan().size(); ++i) {
+        if (IsToDo(i)) {
+            placesOfRequests_.push_back(static_cast<std::uint32_t>(i));
         }
     }
+    // The children open each movie by its path.
+    plan_->EndLists();
+    const WorkerRequests requests = {placesOfRequests_.size(), [this](std::size_t number) {
+                                         return plan()[placesOfRequests_[number]].movie;
+                                     }};
     WorkerCall call = options_.workers;
     if (!options_.together.empty()) {
         call.writeNear = host::system::TemporaryFolder();
     } else if (options_.Saves()) {
         call.writeNear = PlaceToWrite();
     }
-    progress_.emplace(doing_, requests.size());
+    progress_.emplace(doing_, requests.count);
     RunInWorkers(call, requests, *this);
     progress_.reset();
     if (!DelayedSignals::HaveCome()) {
-        TellThoseBefore(steps_.size());
+        TellThoseBefore(plan().size());
     }
 }
 
 void MoviesRun::TellThoseBefore(std::size_t place) {
     for (; nextPlace_ < place; ++nextPlace_) {
-        TellInstead(steps_[nextPlace_]);
+        TellInstead(nextPlace_);
     }
 }
 
@@ -241,13 +245,15 @@ void MoviesRun::Take(std::size_t number, const WorkerResult& result) {
     const std::size_t place = placesOfRequests_[number];
     TellThoseBefore(place);
     ++nextPlace_;
-    progress_->Step(DisplayPath(std::filesystem::path(steps_[place].movie).filename()));
+    const MovieStep step = plan()[place];
+    progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
     Notice("{}", result.told);
-    GoOnAfterFailure(steps_[place].movie, [&] { Deliver(steps_[place], number, result); });
+    GoOnAfterFailure(step.movie, [&] { Deliver(place, step, number, result); });
     answers_.erase(number);
 }
 
-void MoviesRun::Deliver(const MovieStep& step, std::size_t number, const WorkerResult& result) {
+void MoviesRun::Deliver(std::size_t place, const MovieStep& step, std::size_t number,
+                        const WorkerResult& result) {
     if (!result.failure.empty()) {
         throw Failure(kExitFile, step.movie, result.failure);
     }
@@ -263,23 +269,25 @@ void MoviesRun::Deliver(const MovieStep& step, std::size_t number, const WorkerR
         const std::filesystem::path file = PrivateFile(result.folder, number);
         const bool isSaved = answer.status == kExitFine;
         const bool isNotSaved = !isSaved && answer.problem.subject == file;
-        saved = isSaved || isNotSaved ? TargetFor(step) : saved;
+        saved = isSaved || isNotSaved ? TargetFor(place, step) : saved;
         if (isNotSaved) {
             answer.problem.subject = saved;
         } else if (isSaved) {
             PutIntoPlace(file, saved);
         }
     }
-    Settle(step, answer, saved);
+    Settle(place, step, answer, saved);
 }
 
-void MoviesRun::TellInstead(const MovieStep& step) {
-    if (step.isDone) {
+void MoviesRun::TellInstead(std::size_t place) {
+    const MovieStep step = plan()[place];
+    if (IsDone(place)) {
         if (session_.verbosity() > 0) {
             Notice("cliphost: {}: is done already\n",
                    DisplayPath(std::filesystem::path(step.movie)));
         }
-        ShowDone(step.movie, options_.outFolder / OutputName(step.movie, step.number, ending_));
+        ShowDone(step.movie,
+                 options_.outFolder / OutputName(step.movie, plan().NumberOf(place), ending_));
     } else if (step.notice) {
         TellProblem(*step.notice, session_.verbosity());
     } else {
@@ -287,7 +295,7 @@ void MoviesRun::TellInstead(const MovieStep& step) {
     }
 }
 
-void MoviesRun::Settle(const MovieStep& step, const MovieAnswer& answer,
+void MoviesRun::Settle(std::size_t place, const MovieStep& step, const MovieAnswer& answer,
                        const std::filesystem::path& saved) {
     if (answer.status != kExitFine) {
         throw Failure(answer.status, answer.problem);
@@ -295,42 +303,42 @@ void MoviesRun::Settle(const MovieStep& step, const MovieAnswer& answer,
     ++done_;
     // What lacks something is made again each time, and told.
     if (!answer.isPartial) {
-        Remember(step, saved);
+        Remember(place, step, saved);
     }
     status_ = std::max(status_, answer.isPartial ? kExitFile : kExitFine);
     Show(step.movie, answer, saved);
 }
 
-// The steps that the caller named by the files that they are.
-const MoviesRun::StepsByFile& MoviesRun::Named() {
+// The movies that the caller named by the files that they are.
+const MoviesRun::PlacesByFile& MoviesRun::Named() {
     if (named_.empty()) {
-        for (const MovieStep& step : steps_) {
-            const auto number = step.isNamed ? host::system::NumberOf(step.movie) : std::nullopt;
+        for (std::size_t i = 0; i < plan().size(); ++i) {
+            const auto number =
+                plan().IsNamed(i) ? host::system::NumberOf(plan()[i].movie) : std::nullopt;
             if (number) {
-                named_.emplace(*number, &step);
+                named_.emplace(*number, i);
             }
         }
     }
     return named_;
 }
 
-std::filesystem::path MoviesRun::TargetFor(const MovieStep& step) {
+std::filesystem::path MoviesRun::TargetFor(std::size_t place, const MovieStep& step) {
     std::filesystem::path target = options_.file;
-    if (step.number != 0) {
-        target = options_.outFolder / OutputName(step.movie, step.number, ending_);
+    if (const unsigned number = plan().NumberOf(place)) {
+        target = options_.outFolder / OutputName(step.movie, number, ending_);
     }
     for (unsigned number = 1; target.empty(); ++number) {
-        const std::filesystem::path free =
-            options_.outFolder / OutputName(step.movie, number, ending_);
-        if (targetsTaken_.insert(free).second) {
-            target = free;
+        const std::filesystem::path name = OutputName(step.movie, number, ending_);
+        if (targetsTaken_.insert(name.native()).second) {
+            target = options_.outFolder / name;
         }
     }
     const auto inItsPlace = host::system::NumberOf(target);
     if (inItsPlace) {
         RefuseOutputOntoMovie(target, step.movie);
         if (const auto other = Named().find(*inItsPlace); other != Named().end()) {
-            RefuseOutputOntoMovie(target, other->second->movie);
+            RefuseOutputOntoMovie(target, plan()[other->second].movie);
         }
     }
     return target;

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <map>
 #include <memory>
@@ -63,38 +64,48 @@ private:
     void RunHere();
     void RunInChildren();
     std::filesystem::path PlaceToWrite() const;
-    void TellInstead(const MovieStep& step);
+    bool IsDone(std::size_t place) const { return !looks_.empty() && looks_[place].isDone; }
+    // Whether its movie is to be read.
+    bool IsToDo(std::size_t place) const { return !IsDone(place) && plan()[place].IsMovie(); }
+    void TellInstead(std::size_t place);
     void TellThoseBefore(std::size_t place);
     bool Read(std::size_t number, const std::string& answer) override;
     void Take(std::size_t number, const WorkerResult& result) override;
-    void Deliver(const MovieStep& step, std::size_t number, const WorkerResult& result);
-    void Settle(const MovieStep& step, const MovieAnswer& answer,
+    void Deliver(std::size_t place, const MovieStep& step, std::size_t number,
+                 const WorkerResult& result);
+    void Settle(std::size_t place, const MovieStep& step, const MovieAnswer& answer,
                 const std::filesystem::path& saved);
-    void Remember(const MovieStep& step, const std::filesystem::path& saved);
-    void Record(const MovieStep& step, const std::filesystem::path& output,
+    void Remember(std::size_t place, const MovieStep& step, const std::filesystem::path& saved);
+    void Record(std::size_t place, const MovieStep& step, const std::filesystem::path& output,
                 DoneMovies::Known known);
     void TellStop();
     // Does one movie; what it fails with is told, and the next one goes on.
     template <class Work>
     void GoOnAfterFailure(const std::filesystem::path& movie, const Work& work);
-    using StepsByFile = std::map<host::system::FileNumber, const MovieStep*>;
-    const StepsByFile& Named();
-    std::filesystem::path TargetFor(const MovieStep& step);
+    using PlacesByFile = std::map<host::system::FileNumber, std::size_t>;
+    const PlacesByFile& Named();
+    std::filesystem::path TargetFor(std::size_t place, const MovieStep& step);
+    const MoviePlan& plan() const { return *plan_; }
 
     Session& session_;
     const MoviesOptions& options_;
     const char* doing_;
     const char* ending_;
-    std::vector<MovieStep> steps_;
-    std::vector<std::size_t> placesOfRequests_;  // among the steps
+    std::optional<MoviePlan> plan_;
+    struct Look {
+        std::optional<host::system::FileState> state;  // before the movie was read
+        bool isDone = false;                           // its output is there
+    };
+    std::vector<Look> looks_;                      // where there is a folder for outputs
+    std::vector<std::uint32_t> placesOfRequests_;  // among the steps
     std::size_t nextPlace_ = 0;
     std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
     std::optional<Progress> progress_;
-    std::set<std::filesystem::path> targetsTaken_;
-    StepsByFile named_;
+    std::set<std::string> targetsTaken_;  // names in the folder
+    PlacesByFile named_;
     std::optional<DoneMovies> doneMovies_;
     bool canRecord_ = true;
-    std::vector<std::pair<const MovieStep*, std::string>> outputs_;  // to be recorded at a stop
+    std::vector<std::pair<std::uint32_t, std::string>> outputs_;  // of places; for a stop
     int doneBefore_ = 0;
     bool isStopped_ = false;
     int done_ = 0;

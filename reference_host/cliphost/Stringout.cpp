@@ -26,10 +26,11 @@ namespace {
 constexpr aafUID_t kTopLevel = ncfGuid("0D010102-0101-0700-060E-2B3404010101");
 constexpr aafFrameOffset_t kSecondsAtStart = 3600;
 
-enum class Track { None, Picture, Sound };
+enum class MediaKind { None, Picture, Sound };
 
 struct Part {
     aafSlotID_t slot;
+    aafUID_t data;       // what the clip itself calls it
     aafLength_t frames;  // of the sequence
 };
 
@@ -50,19 +51,21 @@ struct Clip {
     }
 };
 
-Track TrackOf(IAAFMobSlot& slot) {
+aafUID_t DataOf(IAAFMobSlot& slot) {
     host::Ref<IAAFDataDef> data;
     aafUID_t id{};
-    if (slot.GetDataDef(data.Out()) < 0) {
-        return Track::None;
+    if (slot.GetDataDef(data.Out()) >= 0) {
+        if (const auto definition = As<IAAFDefObject>(data.get())) {
+            definition->GetAUID(&id);
+        }
     }
-    const auto definition = As<IAAFDefObject>(data.get());
-    if (!definition || definition->GetAUID(&id) < 0) {
-        return Track::None;
-    }
-    return id == kAAFDataDef_Picture || id == kAAFDataDef_LegacyPicture ? Track::Picture
-           : id == kAAFDataDef_Sound || id == kAAFDataDef_LegacySound   ? Track::Sound
-                                                                        : Track::None;
+    return id;
+}
+
+MediaKind TrackOf(const aafUID_t& id) {
+    return id == kAAFDataDef_Picture || id == kAAFDataDef_LegacyPicture ? MediaKind::Picture
+           : id == kAAFDataDef_Sound || id == kAAFDataDef_LegacySound   ? MediaKind::Sound
+                                                                        : MediaKind::None;
 }
 
 // Whole frames of the sequence in a slot; 0 where it has no length.
@@ -97,10 +100,12 @@ Clip ClipOf(IAAFMob& mob, const aafRational_t& rate) {
         if (mob.GetSlotAt(i, slot.Out()) < 0 || slot->GetSlotID(&id) < 0) {
             continue;
         }
-        const Track track = TrackOf(*slot);
-        const aafLength_t frames = track == Track::None ? 0 : FramesIn(*slot, rate);
+        const aafUID_t data = DataOf(*slot);
+        const MediaKind track = TrackOf(data);
+        const aafLength_t frames = track == MediaKind::None ? 0 : FramesIn(*slot, rate);
         if (frames > 0) {
-            (track == Track::Picture ? clip.pictures : clip.sounds).push_back({id, frames});
+            (track == MediaKind::Picture ? clip.pictures : clip.sounds)
+                .push_back({id, data, frames});
         }
     }
     return clip;
@@ -144,11 +149,11 @@ public:
             length += clip.Frames();
         }
         if (hasPictures) {
-            AddTrack(kAAFDataDef_Picture, L"V1", 1, clips, &Clip::pictures, 0);
+            AddTrack(L"V1", 1, clips, &Clip::pictures, 0);
         }
         for (std::size_t i = 0; i < sounds; ++i) {
-            AddTrack(kAAFDataDef_Sound, L"A" + std::to_wstring(i + 1),
-                     static_cast<aafUInt32>(i + 1), clips, &Clip::sounds, i);
+            AddTrack(L"A" + std::to_wstring(i + 1), static_cast<aafUInt32>(i + 1), clips,
+                     &Clip::sounds, i);
         }
         AddTimecode(length);
         SetId(clips);
@@ -207,10 +212,13 @@ private:
         }
     }
 
-    void AddTrack(const aafUID_t& kind, const std::wstring& name, aafUInt32 number,
-                  const std::vector<Clip>& clips, std::vector<Part> Clip::*parts,
-                  std::size_t which) {
-        const auto data = Data(kind);
+    // A track of what it is in the first clip that has it.
+    void AddTrack(const std::wstring& name, aafUInt32 number, const std::vector<Clip>& clips,
+                  std::vector<Part> Clip::*parts, std::size_t which) {
+        const auto first = std::find_if(clips.begin(), clips.end(), [&](const Clip& clip) {
+            return (clip.*parts).size() > which;
+        });
+        const auto data = Data(((*first).*parts)[which].data);
         const auto sequence = New<IAAFSequence>(AUID_AAFSequence);
         Check(sequence->Initialize(data.get()));
         aafLength_t gap = 0;

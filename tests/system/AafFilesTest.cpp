@@ -366,6 +366,8 @@ TEST_F(Stringout, RefersToTheClipsByTheirIdsAndSlots) {
     const Json& clip = sequence["Slots"][0]["Segment"][0]["Components"][0];
     EXPECT_EQ(clip["SourceID"], master["MobID"]);
     EXPECT_EQ(clip["StartTime"], "0");
+    EXPECT_EQ(clip["DataDefinition"], master["Slots"][0]["Segment"][0]["DataDefinition"])
+        << "pictures by the same name";
     std::set<std::string> pictures;
     for (const Json& slot : master["Slots"]) {
         if (slot["Segment"][0]["DataDefinition"].get<std::string>().find("Picture") !=
