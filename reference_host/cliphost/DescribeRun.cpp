@@ -9,6 +9,7 @@
 
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
@@ -162,12 +163,10 @@ void DescribeRun::Finish(int described, int failed) {
         }
     }
     // Movies of which nothing is known here may be those that a rule is for.
-    const bool areAllHere =
-        doneBefore() == 0 && !IsStopped() && options_.movies.shard.IsWhole() && described > 0;
-    for (const std::string& rule : maps_.Unused()) {
-        if (areAllHere) {
-            TellAlso(Failure(kExitCaller, "--map " + rule, "nothing was mapped by it",
-                             "give FROM as the locators of `cliphost describe` begin"));
+    if (doneBefore() == 0 && !IsStopped() && options_.movies.shard.IsWhole() && described > 0) {
+        for (const Failure& unused :
+             UnusedMaps(maps_, "give FROM as the locators of `cliphost describe` begin")) {
+            TellAlso(unused);
         }
     }
     if (!options_.form.json) {

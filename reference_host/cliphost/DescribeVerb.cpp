@@ -5,6 +5,7 @@
 #include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
@@ -24,19 +25,10 @@ void AddForm(CLI::App& verb, DescriptionForm& form, std::string& pinned) {
     verb.add_option("--pin-time", pinned,
                     "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
                     "same movie gives the same bytes");
-    verb.add_option_function<std::vector<std::string>>(
-            "--map",
-            [&form](const std::vector<std::string>& rules) {
-                for (const std::string& rule : rules) {
-                    form.maps.Add(rule);
-                }
-            },
-            "FROM=TO, for another machine that reads what is saved: locators of movies in the "
-            "folder "
-            "FROM name TO instead, which is a folder, a drive (M:) or a share (//server/share); "
-            "may "
-            "be given several times, and the longest FROM counts")
-        ->allow_extra_args(false);
+    AddMapOption(verb, form.maps,
+                 "FROM=TO, for another machine that reads what is saved: locators of movies in the "
+                 "folder FROM name TO instead, which is a folder, a drive (M:) or a share "
+                 "(//server/share); may be given several times, and the longest FROM counts");
 }
 
 SessionOptions WithTime(const SessionOptions& session, const std::string& pinned) {

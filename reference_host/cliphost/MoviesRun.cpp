@@ -38,7 +38,9 @@ void MoviesRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work&
     } catch (const Failure& failure) {
         ++failed_;
         status_ = std::max(status_, failure.status());
-        TellProblem(failure.problem(), session_.verbosity());
+        if (TellsFailures()) {
+            TellProblem(failure.problem(), session_.verbosity());
+        }
         ShowFailure(movie, failure.problem());
     } catch (const ReaderGone&) {
         // It has seen enough.
@@ -219,7 +221,7 @@ void MoviesRun::RunInChildren() {
                                          return plan()[placesOfRequests_[number]].movie;
                                      }};
     WorkerCall call = options_.workers;
-    if (!options_.together.empty()) {
+    if (Collects()) {
         call.writeNear = host::system::TemporaryFolder();
     } else if (options_.Saves()) {
         call.writeNear = PlaceToWrite();
@@ -260,7 +262,7 @@ void MoviesRun::Deliver(std::size_t place, const MovieStep& step, std::size_t nu
     }
     MovieAnswer& answer = answers_[number];
     std::filesystem::path saved;
-    if (!options_.together.empty() && answer.status == kExitFine) {
+    if (Collects() && answer.status == kExitFine) {
         const std::filesystem::path file = PrivateFile(result.folder, number);
         Collect(step.movie, file);
         std::error_code ignored;

@@ -43,7 +43,10 @@ protected:
     virtual void ShowFailure(const std::filesystem::path&, const Problem&) {}
     virtual void ShowDone(const std::filesystem::path& /*movie*/,
                           const std::filesystem::path& /*output*/) {}
+    // Whether a failure is told on standard error, too.
+    virtual bool TellsFailures() const { return true; }
     // What is made of all takes the file that a child process has made of one.
+    virtual bool Collects() const { return !options_.together.empty(); }
     virtual void Collect(const std::filesystem::path& /*movie*/,
                          const std::filesystem::path& /*file*/) {}
     // After all.
