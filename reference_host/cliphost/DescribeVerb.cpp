@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "reference_host/cliphost/DescribeRun.h"
+#include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
@@ -15,7 +16,11 @@ namespace {
 
 // What both processes are told of a description.
 void AddForm(CLI::App& verb, DescriptionForm& form, std::string& pinned) {
-    verb.add_flag("--json", form.json, kJsonHelp);
+    auto* const json = verb.add_flag("--json", form.json, kJsonHelp);
+    verb.add_flag("--jsonl", form.lines,
+                  "As JSON, a line for each movie as soon as it is done, with the members of an "
+                  "entry of --json")
+        ->excludes(json);
     verb.add_flag("-q,--quiet", form.quiet, "Only a line for each movie");
     verb.add_option("--pin-time", pinned,
                     "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
@@ -39,6 +44,7 @@ void AddDescribeForParent(CLI::App& app, const SessionOptions& session, int& sta
     CLI::App* const verb = AddWorkerVerb(app, worker);
     AddForm(*verb, *form, *pinned);
     verb->callback([&session, &status, worker, form, pinned] {
+        form->json = form->json || form->lines;
         Session running(WithTime(session, *pinned));
         ServeMovies(running, *worker,
                     [&](const std::filesystem::path& movie, const PlaceOfFile& place) {
@@ -56,7 +62,6 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     verb->footer("Example: cliphost describe clip.mov --aaf clip.aaf");
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
-    verb->add_option("paths", options->movies.paths, "Movies and folders")->required();
     auto* const aaf =
         verb->add_option("--aaf", options->movies.file,
                          "Save the file of the only movie here; - for standard output");
@@ -74,10 +79,13 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                    "programs that show sequences alone")
         ->needs(bin);
     AddForm(*verb, options->form, *pinned);
+    AddInputOptions(*verb, options->movies, *aaf);
     AddWorkerOptions(*verb, options->movies.workers);
     AddDescribeForParent(app, session, status);
     verb->callback([&app, verb, &session, &status, options, pinned] {
-        AnswerFailureToo(options->form.json, nlohmann::ordered_json::array(), [&] {
+        NeedInputs(options->movies);
+        options->form.json = options->form.json || options->form.lines;
+        const auto work = [&] {
             if (!options->movies.file.empty() &&
                 (options->movies.paths.size() != 1 ||
                  std::filesystem::is_directory(options->movies.paths[0]))) {
@@ -96,7 +104,12 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));
             status = DescribeRun(running, *options).Run();
-        });
+        };
+        if (options->form.lines) {
+            AnswerFailureInLine(work);
+        } else {
+            AnswerFailureToo(options->form.json, nlohmann::ordered_json::array(), work);
+        }
     });
 }
 
