@@ -53,14 +53,15 @@ struct ClassDefinition::Searched {
     const GUID& id;
     PropertyId pid;
     bool unique;
+    bool optional;
 };
 
 ClassDefinition::Searched ClassDefinition::SearchedAt(std::size_t index) const {
     if (const RefPtr<PropertyDefinition>& property = properties_[index]) {
-        return {property->id(), property->pid(), property->IsUnique()};
+        return {property->id(), property->pid(), property->IsUnique(), property->IsOptional()};
     }
     const BuiltInProperty& entry = builtIn_[index];
-    return {entry.key.id, entry.key.pid, entry.unique};
+    return {entry.key.id, entry.key.pid, entry.unique, entry.optional};
 }
 
 PropertyDefinition* ClassDefinition::PropertyAt(std::size_t index) {
@@ -106,6 +107,19 @@ PropertyDefinition* ClassDefinition::FindProperty(PropertyId pid) {
 
 PropertyDefinition* ClassDefinition::FindUniqueProperty() {
     return FindWhere([](const Searched& property) { return property.unique; });
+}
+
+std::vector<PropertyDefinition*> ClassDefinition::RequiredProperties(const GUID& andThis) {
+    std::vector<PropertyDefinition*> required;
+    for (ClassDefinition* at = this; at != nullptr; at = at->parent_) {
+        for (std::size_t index = 0; index < at->properties_.size(); ++index) {
+            const Searched property = at->SearchedAt(index);
+            if (!property.optional || property.id == andThis) {
+                required.push_back(at->PropertyAt(index));
+            }
+        }
+    }
+    return required;
 }
 
 PropertyDefinition& ClassDefinition::AddProperty(const GUID& id, const std::wstring& name,

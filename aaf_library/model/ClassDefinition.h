@@ -38,6 +38,8 @@ public:
     PropertyDefinition* FindProperty(const GUID& id);
     PropertyDefinition* FindProperty(PropertyId pid);
     PropertyDefinition* FindUniqueProperty();
+    // Those that its objects must have, and the one with that id if it is among the others.
+    std::vector<PropertyDefinition*> RequiredProperties(const GUID& andThis);
     // Adds without the checks that a caller's registration has. pid kNoPropertyId: the next free.
     PropertyDefinition& AddProperty(const GUID& id, const std::wstring& name, const GUID& typeId,
                                     bool optional, bool unique, PropertyId pid = kNoPropertyId);

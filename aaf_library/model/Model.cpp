@@ -49,6 +49,18 @@ Model::~Model() {
     }
 }
 
+void Model::LetGo(const Copier& copier) {
+    waiting_.erase(std::remove(waiting_.begin(), waiting_.end(), &copier), waiting_.end());
+}
+
+void Model::CallWaiting() {
+    while (!waiting_.empty()) {
+        Copier* const copier = waiting_.back();
+        waiting_.pop_back();
+        copier->CopyNow();
+    }
+}
+
 void Model::Release() {
     if (--pins_ == 0 && !dying_) {
         dying_ = true;
@@ -285,6 +297,9 @@ PropertyId Model::EnterProperty(PropertyDefinition& property) {
 }
 
 void Model::ForgetProperty(PropertyDefinition& property) {
+    if (dying_) {
+        return;
+    }
     const auto found = propertyById_.find(property.id());
     if (found != propertyById_.end() && found->second == &property) {
         propertyById_.erase(found);

@@ -52,6 +52,30 @@ public:
     // A deep copy of an object of any model, free, with the definitions that it needs. Definitions
     // of properties and types which this model lacks are registered here.
     RefPtr<Object> CopyObject(const Object& source);
+    // The counterparts in this model of what another model has; they are registered where they are
+    // lacking. Null for a property that can't be had here.
+    ClassDefinition* ClassLike(const ClassDefinition& source);
+    PropertyDefinition* PropertyLike(ClassDefinition& owner, const PropertyDefinition& source);
+    // Registers the definitions that a value of another model refers to.
+    void CopyReferredTo(const PropertyValue& value);
+
+    // -- For those who will copy what the objects hold now, as late as they can.
+    class Copier {
+    public:
+        // Once, before a value changes.
+        virtual void CopyNow() = 0;
+
+    protected:
+        ~Copier() = default;
+    };
+    void LetWait(Copier& copier) { waiting_.push_back(&copier); }
+    void LetGo(const Copier& copier);
+    // By whoever is about to change a value of an object.
+    void TellChange() {
+        if (!waiting_.empty()) {
+            CallWaiting();
+        }
+    }
 
     // -- Meta-dictionary. Null when unknown.
     ClassDefinition* FindClass(const GUID& id);
@@ -94,11 +118,8 @@ private:
     ClassDefinition* AddBuiltInClass(const BuiltInClass& entry);
     ClassDefinition& Enter(RefPtr<ClassDefinition> definition);
     TypeDefinition& Enter(RefPtr<TypeDefinition> type);
-    // The counterparts in this model of what another model has.
-    ClassDefinition* ClassLike(const ClassDefinition& source);
     TypeDefinition* TypeLike(const TypeDefinition& source);
-    PropertyDefinition* PropertyLike(ClassDefinition& owner, const PropertyDefinition& source);
-    void CopyReferredTo(const PropertyValue& value);
+    void CallWaiting();
     HRESULT CopyValue(const PropertyValue& source, Object& target, PropertyDefinition& property);
 
     const ClassRegistry& registry_;
@@ -113,6 +134,7 @@ private:
     std::unordered_map<GUID, PropertyDefinition*, GuidHash> propertyById_;
     PropertyId nextPropertyId_ = 0xFFFF;
     RefPtr<Dictionary> dictionary_;
+    std::vector<Copier*> waiting_;
 };
 
 }  // namespace aaf

@@ -87,9 +87,12 @@ void Model::CopyReferredTo(const PropertyValue& value) {
     }
     for (std::size_t at = 0; at + kGuidSize <= value.bytes().size(); at += kGuidSize) {
         const GUID id = GuidAt(value.bytes().data() + at);
+        if (dictionary_->FindDefinition(weak->targetClass(), id) != nullptr) {
+            continue;
+        }
         auto* definition =
             dynamic_cast<DefinitionObject*>(type.model()->FindTarget(weak->targetClass(), id));
-        if (definition != nullptr && FindTarget(weak->targetClass(), id) == nullptr) {
+        if (definition != nullptr) {
             const RefPtr<Object> copy = CopyObject(*definition);
             dictionary_->AddDefinition(weak->targetClass(), copy.get());
         }

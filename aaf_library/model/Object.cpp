@@ -45,6 +45,7 @@ HRESULT Object::RemoveValue(const PropertyKey& key) {
     if (found == values_.end()) {
         return AAFRESULT_PROP_NOT_PRESENT;
     }
+    model()->TellChange();
     const RefPtr<PropertyValue> value = std::move(found->second);
     values_.erase(found);
     value->LeaveObject();

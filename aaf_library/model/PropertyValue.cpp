@@ -4,6 +4,7 @@
 
 #include <algorithm>
 
+#include "aaf_library/model/Model.h"
 #include "aaf_library/model/Object.h"
 #include "aaf_library/model/TypeDefinition.h"
 
@@ -46,8 +47,16 @@ void PropertyValue::Detach(Object& object) {
 
 void PropertyValue::TellHolder() {
     if (holder_ != nullptr) {
+        model()->TellChange();
         holder_->OnValueChange(*this);
     }
+}
+
+void PropertyValue::SetStreamByteOrder(std::uint8_t order) {
+    if (holder_ != nullptr) {
+        model()->TellChange();
+    }
+    streamByteOrder_ = order;
 }
 
 HRESULT PropertyValue::InsertObject(std::size_t index, Object* object) {
@@ -71,6 +80,8 @@ HRESULT PropertyValue::InsertObject(std::size_t index, Object* object) {
     }
     if (index < objects_.size()) {
         TellHolder();
+    } else if (holder_ != nullptr) {
+        model()->TellChange();
     }
     index = std::min(index, objects_.size());
     objects_.insert(objects_.begin() + static_cast<std::ptrdiff_t>(index), RefPtr<Object>(object));

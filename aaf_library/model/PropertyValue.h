@@ -60,7 +60,7 @@ public:
     void SetPosition(std::uint64_t position) { position_ = position; }
     // Byte order mark of a stream: 0x55 unspecified, 0x4C little, 0x42 big.
     std::uint8_t streamByteOrder() const { return streamByteOrder_; }
-    void SetStreamByteOrder(std::uint8_t order) { streamByteOrder_ = order; }
+    void SetStreamByteOrder(std::uint8_t order);
 
     // -- IAAFPropertyValue
     HRESULT GetType(IAAFTypeDef** typeDef) override;

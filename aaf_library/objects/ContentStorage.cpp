@@ -28,6 +28,22 @@ Mob* ContentStorage::MobAt(aafUInt32 index) const {
     return dynamic_cast<Mob*>(ObjectAt(prop::ContentStorage_Mobs, index));
 }
 
+bool ContentStorage::HoldsMobsAlone() const {
+    for (const auto& [pid, value] : values()) {
+        const bool isEmptySet =
+            pid == prop::ContentStorage_EssenceData.pid && value->objects().empty();
+        if (pid != prop::ContentStorage_Mobs.pid && !isEmptySet) {
+            return false;
+        }
+    }
+    for (aafUInt32 at = 0; at < MobCount(); ++at) {
+        if (MobAt(at) == nullptr) {
+            return false;
+        }
+    }
+    return true;
+}
+
 HRESULT ContentStorage::LookupMob(aafMobID_constref mobID, IAAFMob** mob) {
     if (mob == nullptr) {
         return AAFRESULT_NULL_PARAM;

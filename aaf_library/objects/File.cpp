@@ -149,8 +149,16 @@ HRESULT File::Load(aafCharacter_constptr path, aafUInt32 modeFlags) {
     return AAFRESULT_SUCCESS;
 }
 
-ContentStorage* File::OpenStorage() const {
-    return IsOpen() ? header_->content() : nullptr;
+stored::SectorSize File::SizeOfSectors() const {
+    return largeSectors_ ? stored::SectorSize::Bytes4096 : stored::SectorSize::Bytes512;
+}
+
+File::~File() {
+    StopAwaiting();
+}
+
+ContentStorage* File::OpenStorage() {
+    return IsOpen() && PrepareToShow() >= 0 ? header_->content() : nullptr;
 }
 
 HRESULT File::Open() {
@@ -161,14 +169,22 @@ HRESULT File::GetHeader(IAAFHeader** header) {
     if (header == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    return IsOpen() ? GiveOut(header_.get(), header) : AAFRESULT_NOT_OPEN;
+    if (!IsOpen()) {
+        return AAFRESULT_NOT_OPEN;
+    }
+    const HRESULT result = PrepareToShow();
+    return result < 0 ? result : GiveOut(header_.get(), header);
 }
 
 HRESULT File::GetDictionary(IAAFDictionary** dictionary) {
     if (dictionary == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    return IsOpen() ? GiveOut(&model_->dictionary(), dictionary) : AAFRESULT_NOT_OPEN;
+    if (!IsOpen()) {
+        return AAFRESULT_NOT_OPEN;
+    }
+    const HRESULT result = PrepareToShow();
+    return result < 0 ? result : GiveOut(&model_->dictionary(), dictionary);
 }
 
 HRESULT File::GetRevision(aafFileRev_t* rev) {
@@ -189,9 +205,12 @@ HRESULT File::Save() {
     if (access_ == Access::Read) {
         return AAFRESULT_WRONG_OPENMODE;
     }
+    HRESULT result = TakeContent();
+    if (result < 0) {
+        return result;
+    }
     header_->Touch();
     TellProgress();
-    HRESULT result = AAFRESULT_SUCCESS;
     if (access_ == Access::Transient) {
         // Nothing is written, but what could not be written is told.
         try {
@@ -201,10 +220,8 @@ HRESULT File::Save() {
             result = AAFRESULT_INVALID_OBJ;
         }
     } else {
-        const auto sectors =
-            largeSectors_ ? stored::SectorSize::Bytes4096 : stored::SectorSize::Bytes512;
-        result =
-            ResultOf(stored::SaveModel(*model_, *header_, path_, sectors), AAFRESULT_NOT_WRITEABLE);
+        result = ResultOf(stored::SaveModel(*model_, *header_, path_, SizeOfSectors()),
+                          AAFRESULT_NOT_WRITEABLE);
     }
     saved_ = result >= 0;
     TellProgress();
@@ -218,6 +235,7 @@ HRESULT File::Close() {
     if (failsUnsaved_ && access_ == Access::Write && !saved_) {
         return AAFRESULT_UNSAVED_CHANGES;
     }
+    StopAwaiting();
     header_ = nullptr;
     model_ = nullptr;
     return AAFRESULT_SUCCESS;
@@ -237,6 +255,15 @@ HRESULT File::SaveCopyAs(IAAFFile* destFile) {
     if (target->access_ == Access::Read) {
         return AAFRESULT_WRONG_OPENMODE;
     }
+    if (const HRESULT result = TakeContent(); result < 0) {
+        return result;
+    }
+    if (target != this && CanSaveContentAs(*target)) {
+        const HRESULT result = CopyExtensions(*model_, *target->model_);
+        if (result < 0 || SaveContentAs(*target)) {
+            return result;
+        }
+    }
     if (OpenStorage() == nullptr || target->OpenStorage() == nullptr) {
         return AAFRESULT_OBJECT_NOT_FOUND;
     }
@@ -248,26 +275,86 @@ HRESULT File::SaveCopyAs(IAAFFile* destFile) {
 }
 
 HRESULT File::CopyContentTo(File& target) {
-    const ContentStorage& from = *OpenStorage();
-    ContentStorage& to = *target.OpenStorage();
     HRESULT result = CopyExtensions(*model_, *target.model_);
+    if (result >= 0) {
+        result = target.TakeMobs(*header_->content());
+    }
+    aafUID_t pattern{};
+    if (result >= 0 && header_->GetOperationalPattern(&pattern) >= 0) {
+        target.header_->SetOperationalPattern(pattern);
+    }
+    return result;
+}
+
+HRESULT File::TakeMobs(const ContentStorage& from) {
+    ContentStorage& to = *header_->content();
+    HRESULT result = AAFRESULT_SUCCESS;
     for (aafUInt32 at = 0; result >= 0 && at < from.MobCount(); ++at) {
         RefPtr<Mob> copy;
         const Mob* const mob = from.MobAt(at);
         result = mob == nullptr ? AAFRESULT_INVALID_OBJ : to.AddCopy(*mob, true, copy);
     }
-    if (result < 0) {
-        // The target takes all or nothing.
-        while (to.MobCount() > 0) {
-            to.RemoveObjectAt(prop::ContentStorage_Mobs, 0);
-        }
-        return result;
+    // All or nothing.
+    while (result < 0 && to.MobCount() > 0) {
+        to.RemoveObjectAt(prop::ContentStorage_Mobs, 0);
     }
+    return result;
+}
+
+// Whether the target is as it was made, so that all that goes into it comes from here.
+bool File::CanSaveContentAs(const File& target) const {
+    const ContentStorage* const from = header_->content();
+    const ContentStorage* const to = target.header_->content();
+    return target.access_ == Access::Write && !target.saved_ && !target.isShown_ &&
+           from != nullptr && to != nullptr && from->classId() == to->classId() &&
+           from->HoldsMobsAlone();
+}
+
+// Writes the target without a copy of what goes into it. False, and nothing is told, where that
+// fails: the way through a copy then finds out why, and leaves the target as it has to.
+bool File::SaveContentAs(File& target) {
     aafUID_t pattern{};
     if (header_->GetOperationalPattern(&pattern) >= 0) {
         target.header_->SetOperationalPattern(pattern);
     }
-    return result;
+    target.header_->Touch();
+    if (!stored::SaveModel(*target.model_, *target.header_, target.path_, target.SizeOfSectors(),
+                           header_->content())) {
+        target.header_->RemoveValue(prop::Header_OperationalPattern);
+        return false;
+    }
+    TellProgress();
+    TellProgress();
+    target.saved_ = true;
+    target.AwaitContentOf(*header_);
+    return true;
+}
+
+void File::AwaitContentOf(Header& source) {
+    awaited_ = RefPtr<Header>(&source);
+    source.model()->LetWait(*this);
+}
+
+RefPtr<Header> File::StopAwaiting() {
+    RefPtr<Header> source = std::move(awaited_);
+    if (source) {
+        source->model()->LetGo(*this);
+    }
+    return source;
+}
+
+HRESULT File::TakeContent() {
+    const RefPtr<Header> source = StopAwaiting();
+    return source ? TakeMobs(*source->content()) : AAFRESULT_SUCCESS;
+}
+
+void File::CopyNow() {
+    TakeContent();
+}
+
+HRESULT File::PrepareToShow() {
+    isShown_ = true;
+    return TakeContent();
 }
 
 }  // namespace aaf

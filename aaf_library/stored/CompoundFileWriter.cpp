@@ -8,20 +8,20 @@
 #include "aaf_library/stored/UpperCase.h"
 
 #include <algorithm>
-#include <numeric>
 #include <string_view>
-#include <tuple>
 #include <utility>
 
 namespace aaf::stored {
 
 namespace {
 
-constexpr std::u16string_view kNoNameHas{u"/\\:!\0", 5};
+bool IsInNoName(char16_t unit) {
+    return unit == u'/' || unit == u'\\' || unit == u':' || unit == u'!' || unit == u'\0';
+}
 
 void CheckName(const std::u16string& name) {
     if (name.empty() || name.size() > kLongestName ||
-        name.find_first_of(kNoNameHas) != std::u16string::npos) {
+        std::any_of(name.begin(), name.end(), IsInNoName)) {
         throw StoredError("\"" + ToUtf8(name) + "\" cannot be the name of a storage or stream");
     }
 }
@@ -42,10 +42,12 @@ std::size_t CountOf(std::size_t size, std::size_t part) {
 
 // The entries of a run that begins behind the last one.
 void AppendRun(std::vector<std::uint32_t>& table, std::size_t count) {
-    for (std::size_t i = 1; i < count; ++i) {
-        table.push_back(static_cast<std::uint32_t>(table.size() + 1));
+    const std::size_t first = table.size();
+    table.resize(first + std::max<std::size_t>(count, 1));
+    for (std::size_t at = first; at < table.size(); ++at) {
+        table[at] = static_cast<std::uint32_t>(at + 1);
     }
-    table.push_back(kEndOfChain);
+    table.back() = kEndOfChain;
 }
 
 void FillUp(std::vector<std::uint32_t>& numbers, std::size_t perSector) {
@@ -98,6 +100,7 @@ void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
         // Leaves room for what follows the large part of a file.
         directory_.reserve(part.directory.size() * 3 / 2);
         small_.reserve(small_.size() + part.small.size() * 3 / 2);
+        smallTable_.reserve(smallTable_.size() + part.smallTable.size() * 3 / 2);
     }
     // Its root becomes this storage, and its other entries stand behind it.
     directory_.insert(directory_.end(), part.directory.begin() + kDirectoryEntrySize,
@@ -117,8 +120,10 @@ void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
         moveBy(entry + kEntryStartOffset, sectorsBefore);
     }
     small_.insert(small_.end(), part.small.begin(), part.small.end());
-    for (std::uint32_t next : part.smallTable) {
-        smallTable_.push_back(next > kLastPlainSector ? next : next + sectorsBefore);
+    smallTable_.insert(smallTable_.end(), part.smallTable.begin(), part.smallTable.end());
+    for (std::size_t at = sectorsBefore; at < smallTable_.size(); ++at) {
+        std::uint32_t& next = smallTable_[at];
+        next = next > kLastPlainSector ? next : next + sectorsBefore;
     }
 }
 
@@ -131,18 +136,30 @@ std::optional<CompoundPart> CompoundFileWriter::FinishPart() {
 }
 
 Bytes CompoundFileWriter::Finish() {
-    LinkSiblings();
-    // Room for all that follows but the table of a file of megabytes.
-    file_.reserve(file_.size() + small_.size() + small_.size() / 16 + directory_.size() +
-                  8 * sectorSize_);
-    if (!small_.empty()) {
-        SetContent(kRoot, AppendSectors(small_), small_.size());
+    Bytes file;
+    for (const Bytes& piece : FinishPieces()) {
+        file.insert(file.end(), piece.begin(), piece.end());
     }
-    AppendSmallTable();
-    SetHeader(kFirstDirectoryOffset, AppendSectors(directory_));
+    return file;
+}
+
+std::vector<Bytes> CompoundFileWriter::FinishPieces() {
+    LinkSiblings();
+    if (!small_.empty()) {
+        SetContent(kRoot, NumberSectors(small_.size()), small_.size());
+    }
+    Bytes smallTable = SmallTable();
+    SetHeader(kFirstDirectoryOffset, NumberSectors(directory_.size()));
     SetHeader(kDirectoryCountOffset, large_ ? CountOf(directory_.size(), sectorSize_) : 0);
-    AppendTable();
-    return std::move(file_);
+    Bytes table = Table();
+    for (Bytes* const piece : {&small_, &directory_}) {
+        piece->resize(CountOf(piece->size(), sectorSize_) * sectorSize_);
+    }
+    std::vector<Bytes> pieces;
+    for (Bytes* const piece : {&file_, &small_, &smallTable, &directory_, &table}) {
+        pieces.push_back(std::move(*piece));
+    }
+    return pieces;
 }
 
 std::uint32_t CompoundFileWriter::AddEntry(Storage holder, const std::u16string& name,
@@ -198,29 +215,46 @@ void CompoundFileWriter::SetHeader(std::size_t offset, std::size_t value) {
 // text in upper case. Each is the right neighbour of the one before and all
 // are black: the simplest tree that the format allows.
 void CompoundFileWriter::LinkSiblings() {
-    const auto order = [](const Place& place) {
-        return std::tie(place.holder, place.length, place.name);
+    const auto order = [](const Place& left, const Place& right) {
+        if (left.holder != right.holder) {
+            return left.holder < right.holder ? -1 : 1;
+        }
+        if (left.length != right.length) {
+            return left.length < right.length ? -1 : 1;
+        }
+        return std::u16string_view(left.name.data(), left.length)
+            .compare(std::u16string_view(right.name.data(), right.length));
     };
-    std::sort(places_.begin() + 1, places_.end(),
-              [&](const Place& left, const Place& right) { return order(left) < order(right); });
+    std::vector<const Place*> sorted;
+    sorted.reserve(places_.size());
     for (std::size_t i = 1; i < places_.size(); ++i) {
-        const Place& place = places_[i];
-        const Place& before = places_[i - 1];
-        const bool first = i == 1 || before.holder != place.holder;
-        if (!first && order(before) == order(place)) {
-            throw StoredError("\"" + ToUtf8(NameOf(std::max(before.index, place.index))) +
+        sorted.push_back(&places_[i]);
+    }
+    std::sort(sorted.begin(), sorted.end(),
+              [&](const Place* left, const Place* right) { return order(*left, *right) < 0; });
+    const Place* before = nullptr;
+    for (const Place* const place : sorted) {
+        const bool first = before == nullptr || before->holder != place->holder;
+        if (!first && order(*before, *place) == 0) {
+            throw StoredError("\"" + ToUtf8(NameOf(std::max(before->index, place->index))) +
                               "\" is twice in one storage");
         }
-        PutNumber(first ? EntryAt(place.holder) + kEntryChildOffset
-                        : EntryAt(before.index) + kEntryRightOffset,
-                  place.index);
+        PutNumber(first ? EntryAt(place->holder) + kEntryChildOffset
+                        : EntryAt(before->index) + kEntryRightOffset,
+                  place->index);
+        before = place;
     }
 }
 
 // Gives the number of the first sector.
-std::uint32_t CompoundFileWriter::AppendSectors(const Bytes& content) {
+std::uint32_t CompoundFileWriter::NumberSectors(std::size_t size) {
     const auto first = static_cast<std::uint32_t>(table_.size());
-    AppendRun(table_, CountOf(content.size(), sectorSize_));
+    AppendRun(table_, CountOf(size, sectorSize_));
+    return first;
+}
+
+std::uint32_t CompoundFileWriter::AppendSectors(const Bytes& content) {
+    const std::uint32_t first = NumberSectors(content.size());
     file_.insert(file_.end(), content.begin(), content.end());
     file_.resize((table_.size() + 1) * sectorSize_);
     return first;
@@ -234,16 +268,18 @@ std::uint32_t CompoundFileWriter::AppendSmallSectors(const Bytes& content) {
     return first;
 }
 
-void CompoundFileWriter::AppendSmallTable() {
+Bytes CompoundFileWriter::SmallTable() {
     FillUp(smallTable_, sectorSize_ / 4);
-    const Bytes table = NumberBytes(smallTable_);
-    SetHeader(kFirstSmallTableOffset, table.empty() ? kEndOfChain : AppendSectors(table));
+    Bytes table = NumberBytes(smallTable_);
+    SetHeader(kFirstSmallTableOffset, table.empty() ? kEndOfChain : NumberSectors(table.size()));
     SetHeader(kSmallTableCountOffset, table.size() / sectorSize_);
+    return table;
 }
 
 // The table has entries for its own sectors, too, and for those of the list
-// that goes on where the header's list of its sectors is full.
-void CompoundFileWriter::AppendTable() {
+// that goes on where the header's list of its sectors is full. That list comes
+// with it.
+Bytes CompoundFileWriter::Table() {
     const std::size_t perSector = sectorSize_ / 4;
     const std::size_t used = table_.size();
     std::size_t tables = 0;
@@ -275,13 +311,12 @@ void CompoundFileWriter::AppendTable() {
     SetHeader(kFirstTableListOffset, lists == 0 ? kEndOfChain : used + tables);
     SetHeader(kTableListCountOffset, lists);
 
-    const Bytes table = NumberBytes(table_);
+    Bytes table = NumberBytes(table_);
     const Bytes listed = NumberBytes(list);
     const auto behindHeader = listed.begin() + kHeaderTableCount * 4;
     std::copy(listed.begin(), behindHeader, file_.begin() + kTableListOffset);
-    file_.reserve(file_.size() + table.size() + listed.size());
-    file_.insert(file_.end(), table.begin(), table.end());
-    file_.insert(file_.end(), behindHeader, listed.end());
+    table.insert(table.end(), behindHeader, listed.end());
+    return table;
 }
 
 }  // namespace aaf::stored

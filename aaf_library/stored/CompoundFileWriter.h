@@ -39,8 +39,10 @@ public:
     // A copy of the part, under a name of its own.
     void AddPart(Storage holder, const std::u16string& name, const CompoundPart& part);
 
-    // Gives the whole file, signature included; once.
+    // Gives the whole file, signature included; once. In pieces, which follow each other, nothing
+    // of it is copied once more.
     Bytes Finish();
+    std::vector<Bytes> FinishPieces();
     // Or the root as a part; none when it holds a long stream.
     std::optional<CompoundPart> FinishPart();
 
@@ -48,9 +50,9 @@ private:
     // A directory entry among those of its storage.
     struct Place {
         Storage holder = kRoot;
+        std::uint32_t index = 0;
         std::size_t length = 0;
         std::array<char16_t, kLongestName> name{};  // in upper case
-        std::uint32_t index = 0;
     };
 
     std::uint32_t AddEntry(Storage holder, const std::u16string& name, EntryKind kind);
@@ -59,10 +61,11 @@ private:
     void SetContent(std::uint32_t index, std::uint32_t start, std::size_t size);
     void SetHeader(std::size_t offset, std::size_t value);
     std::uint32_t AppendSectors(const Bytes& content);
+    std::uint32_t NumberSectors(std::size_t size);
     std::uint32_t AppendSmallSectors(const Bytes& content);
     void LinkSiblings();
-    void AppendSmallTable();
-    void AppendTable();
+    Bytes SmallTable();
+    Bytes Table();
 
     const std::size_t sectorSize_;
     const bool large_;

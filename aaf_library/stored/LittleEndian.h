@@ -6,8 +6,8 @@
 #include "aaf_library/stored/StoredTree.h"
 
 #include <cstddef>
-#include <iterator>
 #include <string>
+#include <utility>
 
 namespace aaf::stored {
 
@@ -30,9 +30,7 @@ public:
 
     template <typename Number>
     ByteWriter& AppendNumber(Number value) {
-        std::uint8_t bytes[sizeof(Number)];
-        PutNumber(bytes, value);
-        bytes_.insert(bytes_.end(), std::begin(bytes), std::end(bytes));
+        PutNumber(AppendRoom(sizeof(Number)), value);
         return *this;
     }
     template <typename Range>
@@ -42,15 +40,26 @@ public:
     }
     // A text with its terminator.
     ByteWriter& AppendText(const std::u16string& text) {
+        std::uint8_t* at = AppendRoom(2 * text.size() + 2);
         for (char16_t unit : text) {
-            AppendNumber(static_cast<std::uint16_t>(unit));
+            PutNumber(at, static_cast<std::uint16_t>(unit));
+            at += 2;
         }
-        return AppendNumber(std::uint16_t{0});
+        return *this;
     }
 
     const Bytes& bytes() const { return bytes_; }
+    Bytes Take() { return std::move(bytes_); }
+    // Keeps its room.
+    void Clear() { bytes_.clear(); }
 
 private:
+    // Zeroed, and good until something else is appended.
+    std::uint8_t* AppendRoom(std::size_t size) {
+        bytes_.resize(bytes_.size() + size);
+        return bytes_.data() + bytes_.size() - size;
+    }
+
     Bytes bytes_;
 };
 

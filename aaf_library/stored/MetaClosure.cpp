@@ -21,6 +21,7 @@ MetaClass RecordOf(ClassDefinition& definition) {
     record.name = definition.name();
     record.parent = definition.parent() == nullptr ? record.id : definition.parent()->id();
     record.concrete = definition.concrete();
+    record.properties.reserve(definition.properties().size());
     for (const RefPtr<PropertyDefinition>& property : definition.properties()) {
         MetaProperty entry;
         entry.id = property->id();
@@ -29,9 +30,23 @@ MetaClass RecordOf(ClassDefinition& definition) {
         entry.type = property->typeId();
         entry.optional = property->IsOptional();
         entry.unique = property->IsUnique();
-        record.properties.push_back(entry);
+        record.properties.push_back(std::move(entry));
     }
     return record;
+}
+
+// Whether an id was not met before; it is met now.
+template <class Entry>
+bool IsNew(const Entry* entry, Span<Entry> table, std::vector<bool>& metEntries, const GUID& id,
+           std::unordered_set<GUID, GuidHash>& metIds) {
+    if (entry == nullptr) {
+        return metIds.insert(id).second;
+    }
+    metEntries.resize(table.size());
+    std::vector<bool>::reference met = metEntries[static_cast<std::size_t>(entry - table.begin())];
+    const bool isNew = !met;
+    met = true;
+    return isNew;
 }
 
 }  // namespace
@@ -86,10 +101,10 @@ void MetaClosure::AddPending() {
 }
 
 void MetaClosure::EnterClass(const GUID& id) {
-    if (!classes_.insert(id).second) {
+    const BuiltInClass* const entry = FindBuiltInClass(id);
+    if (!IsNew(entry, BuiltInClasses(), builtInClasses_, id, classes_)) {
         return;
     }
-    const BuiltInClass* const entry = FindBuiltInClass(id);
     if (entry != nullptr && model_.HasAsBuiltIn(*entry)) {
         if (builtIn_ == BuiltIn::LeftOut) {
             return;
@@ -114,10 +129,10 @@ void MetaClosure::EnterClass(const GUID& id) {
 }
 
 void MetaClosure::EnterType(const GUID& id) {
-    if (!types_.insert(id).second) {
+    const BuiltInType* const entry = FindBuiltInType(id);
+    if (!IsNew(entry, BuiltInTypes(), builtInTypes_, id, types_)) {
         return;
     }
-    const BuiltInType* const entry = FindBuiltInType(id);
     if (entry != nullptr && model_.HasAsBuiltIn(*entry)) {
         if (builtIn_ == BuiltIn::LeftOut) {
             return;

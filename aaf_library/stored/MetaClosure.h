@@ -45,6 +45,9 @@ private:
     Model& model_;
     const BuiltIn builtIn_;
     MetaRecords records_;
+    // What was met: of the built-in tables by place, of others by id.
+    std::vector<bool> builtInClasses_;
+    std::vector<bool> builtInTypes_;
     std::unordered_set<GUID, GuidHash> classes_;
     std::unordered_set<GUID, GuidHash> types_;
     std::vector<GUID> pendingClasses_;

@@ -12,9 +12,9 @@
 namespace aaf::stored {
 
 FileResult SaveModel(Model& model, Object& header, const std::filesystem::path& path,
-                     SectorSize sectorSize) {
+                     SectorSize sectorSize, const Object* content) {
     try {
-        return SaveTree(TreeToWrite(model, header), path, sectorSize);
+        return SaveTree(TreeToWrite(model, header, content), path, sectorSize);
     } catch (const StoredError& problem) {
         return {FileFailure::NotStorable, path.u8string() + ": " + problem.what()};
     } catch (const std::bad_alloc&) {

@@ -15,10 +15,10 @@ class Object;
 namespace aaf::stored {
 
 // Writes the header with all that it contains, the model's dictionary and the
-// definitions that these need. See ModelWriter.h for what is added and
+// definitions that these need. See ModelWriter.h for what is added, and for the content, and
 // StoredFile.h for how the file is replaced.
 FileResult SaveModel(Model& model, Object& header, const std::filesystem::path& path,
-                     SectorSize sectorSize);
+                     SectorSize sectorSize, const Object* content = nullptr);
 
 // Reads into a new model. The header comes back free; its dictionary is
 // model.dictionary(). On failure the model has to be thrown away and the

@@ -16,8 +16,10 @@
 #include "host_interfaces/aaf/AAFClassIds.h"
 
 #include <algorithm>
+#include <list>
 #include <map>
 #include <set>
+#include <unordered_map>
 
 namespace aaf::stored {
 
@@ -40,9 +42,18 @@ bool IsBuiltInDefinition(const Bytes& id) {
     return false;
 }
 
+bool IsWeak(StoredForm form) {
+    return form == StoredForm::WeakReference || form == StoredForm::WeakVector ||
+           form == StoredForm::WeakSet;
+}
+
 void SortByPid(StoredObject& object) {
-    std::sort(object.properties.begin(), object.properties.end(),
-              [](const StoredProperty& a, const StoredProperty& b) { return a.pid < b.pid; });
+    const auto isBefore = [](const StoredProperty& a, const StoredProperty& b) {
+        return a.pid < b.pid;
+    };
+    if (!std::is_sorted(object.properties.begin(), object.properties.end(), isBefore)) {
+        std::sort(object.properties.begin(), object.properties.end(), isBefore);
+    }
 }
 
 class ModelWriter {
@@ -52,7 +63,10 @@ public:
     ModelWriter(Model& model, MetaDictionary metaDictionary)
         : model_(model), closure_(model), metaDictionary_(metaDictionary) {}
 
-    StoredObject Write(Object& header) {
+    // The content stands in place of the header's own; it may be of another model.
+    StoredObject Write(Object& header, const Object* content) {
+        replaced_ = content == nullptr ? nullptr : header.ObjectAt(prop::Header_Content);
+        content_ = content;
         StoredObject storedHeader = StoredObjectOf(header, prop::Header_Dictionary.pid);
         storedHeader.properties.push_back(ReferenceTo(prop::Header_Dictionary.pid, u"Dictionary",
                                                       StoredDictionary(model_.dictionary())));
@@ -70,6 +84,22 @@ public:
     }
 
 private:
+    // A property as the file has it.
+    struct PropertyFacts {
+        PropertyId from = kNoPropertyId;  // its number in the model of the objects
+        const PropertyDefinition* definition = nullptr;
+        StoredProperty empty;                // of the right form and name, holding nothing yet
+        std::set<Bytes>* targets = nullptr;  // weak forms: what references to that set lead to
+        bool carriesType = false;
+    };
+    // What all objects of a class have in common.
+    struct ClassFacts {
+        ClassDefinition* definition = nullptr;  // as the model that is written has it
+        StoredAuid id{};
+        std::list<PropertyFacts> properties;  // those that were met
+        std::vector<const PropertyDefinition*> required;
+    };
+
     static StoredProperty ReferenceTo(std::uint16_t pid, const std::u16string& name,
                                       StoredObject object) {
         StoredProperty property;
@@ -82,43 +112,97 @@ private:
 
     // All properties of the object but the one that is left out.
     StoredObject StoredObjectOf(const Object& from, PropertyId leftOut = kNoPropertyId) {
+        ClassFacts& facts = FactsOfClass(from);
         StoredObject out;
-        out.classId = AuidOf(from.classId());
-        closure_.AddClass(from.classId());
+        out.classId = facts.id;
         out.properties.reserve(from.values().size() + 2);
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
-                out.properties.push_back(StoredPropertyOf(from, entry.first, *entry.second));
+                out.properties.push_back(
+                    StoredPropertyOf(FactsOfProperty(facts, from, entry.first), *entry.second));
             }
         }
-        AddRequired(from, out, leftOut);
+        AddRequired(facts, out, leftOut);
         SortByPid(out);
         return out;
     }
 
-    StoredProperty StoredPropertyOf(const Object& from, PropertyId pid,
-                                    const PropertyValue& value) {
+    // Whether a definition of any model tells what the model to be written would say: then nothing
+    // has to be made there.
+    static bool Says(const ClassDefinition& definition, const Model& model) {
+        if (definition.model() == &model) {
+            return true;
+        }
+        const ClassDefinition* at = &definition;
+        while (at != nullptr && at->IsAsBuiltIn()) {
+            at = at->parent();
+        }
+        return at == nullptr;
+    }
+
+    ClassFacts& FactsOfClass(const Object& from) {
+        const auto [place, isNew] = classes_.try_emplace(&from.classDefinition());
+        ClassFacts& facts = place->second;
+        if (isNew) {
+            facts.definition = Says(from.classDefinition(), model_)
+                                   ? &from.classDefinition()
+                                   : model_.ClassLike(from.classDefinition());
+            facts.id = AuidOf(from.classId());
+            closure_.AddClass(from.classId());
+            facts.required = RequiredObjects(*facts.definition);
+        }
+        return facts;
+    }
+
+    const PropertyFacts& FactsOfProperty(ClassFacts& facts, const Object& from, PropertyId pid) {
+        for (const PropertyFacts& known : facts.properties) {
+            if (known.from == pid) {
+                return known;
+            }
+        }
         const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
+        const bool isHere = facts.definition == &from.classDefinition() && pid < kFirstLocalPid;
+        if (definition != nullptr && from.model() != &model_ && !isHere) {
+            definition =
+                model_.PropertyLike(*model_.ClassLike(from.classDefinition()), *definition);
+        }
         if (definition == nullptr || definition->type() == nullptr) {
             throw StoredError(PropertyText(pid) + " has no definition");
         }
-        StoredProperty out = EmptyProperty(*definition);
-        if (StoredFormOf(value.type()) != out.form) {
-            throw StoredError(TextOf(*definition) + " holds a value of another form than its type");
+        PropertyFacts& made = facts.properties.emplace_back();
+        made.from = pid;
+        made.definition = definition;
+        made.empty = EmptyProperty(*definition);
+        if (IsWeak(made.empty.form)) {
+            NameTargets(made);
         }
+        const TypeKind kind = definition->type()->Resolved().kind();
+        made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
+        return made;
+    }
+
+    StoredProperty StoredPropertyOf(const PropertyFacts& facts, const PropertyValue& value) {
+        const TypeDefinition& type = *facts.definition->type();
+        if (value.model() != &model_ && value.type().id() != type.id()) {
+            throw StoredError(TextOf(*facts.definition) + " holds a value of a type of its own");
+        }
+        if (&value.type() != &type && StoredFormOf(value.type()) != facts.empty.form) {
+            throw StoredError(TextOf(*facts.definition) +
+                              " holds a value of another form than its type");
+        }
+        StoredProperty out = facts.empty;
         try {
-            Fill(out, *definition, value);
+            Fill(out, facts, value);
         } catch (const StoredError& problem) {
-            throw StoredError(TextOf(*definition) + ": " + problem.what());
+            throw StoredError(TextOf(*facts.definition) + ": " + problem.what());
         }
         return out;
     }
 
-    void Fill(StoredProperty& out, const PropertyDefinition& definition,
-              const PropertyValue& value) {
+    void Fill(StoredProperty& out, const PropertyFacts& facts, const PropertyValue& value) {
         switch (out.form) {
             case StoredForm::Data:
-                NoteCarriedType(value);
+                NoteCarriedType(facts, value);
                 out.bytes = value.bytes();
                 break;
             case StoredForm::Stream:
@@ -127,17 +211,19 @@ private:
             case StoredForm::StrongReference:
             case StoredForm::StrongVector:
             case StoredForm::StrongSet:
+                out.objects.reserve(value.objects().size());
                 for (const RefPtr<Object>& contained : value.objects()) {
-                    out.objects.push_back(StoredObjectOf(*contained));
+                    const Object& object = contained.get() == replaced_ ? *content_ : *contained;
+                    out.objects.push_back(StoredObjectOf(object));
                     if (out.form == StoredForm::StrongSet) {
-                        out.keys.push_back(contained->UniqueKey());
+                        out.keys.push_back(object.UniqueKey());
                     }
                 }
                 break;
             case StoredForm::WeakReference:
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                AddTargets(out, *definition.type(), value.bytes());
+                AddTargets(out, facts, value);
                 break;
         }
     }
@@ -169,18 +255,36 @@ private:
         return key;
     }
 
-    void AddTargets(StoredProperty& out, const TypeDefinition& type, const Bytes& ids) {
-        const TypeFacts reference = FactsOf(ReferenceIn(type));
+    void NameTargets(PropertyFacts& facts) {
+        const TypeFacts reference = FactsOf(ReferenceIn(*facts.definition->type()));
         for (const TypeMember& step : reference.members) {
-            out.targetPath.push_back(PidOf(step.id));
+            facts.empty.targetPath.push_back(PidOf(step.id));
         }
-        out.keyPid = KeyOf(reference.target)->pid();
+        try {
+            facts.empty.keyPid = KeyOf(reference.target)->pid();
+        } catch (const StoredError& problem) {
+            throw StoredError(TextOf(*facts.definition) + ": " + problem.what());
+        }
+        facts.targets = &targets_[facts.empty.targetPath];
+    }
+
+    void AddTargets(StoredProperty& out, const PropertyFacts& facts, const PropertyValue& value) {
+        const Bytes& ids = value.bytes();
+        out.keys.reserve(ids.size() / kIdSize);
         for (std::size_t at = 0; at + kIdSize <= ids.size(); at += kIdSize) {
             const auto from = ids.begin() + static_cast<std::ptrdiff_t>(at);
             out.keys.emplace_back(from, from + kIdSize);
-            if (targets_[out.targetPath].insert(out.keys.back()).second) {
+            if (facts.targets->insert(out.keys.back()).second) {
+                TakeAlong(value);
                 NoteMetaTarget(out.targetPath, GuidOf(out.keys.back()));
             }
+        }
+    }
+
+    // What a value of another model refers to has to be in this one.
+    void TakeAlong(const PropertyValue& value) {
+        if (value.model() != &model_) {
+            model_.CopyReferredTo(value);
         }
     }
 
@@ -208,51 +312,44 @@ private:
     }
 
     // The type that an indirect value names has to be in the file.
-    void NoteCarriedType(const PropertyValue& value) {
-        const TypeKind kind = value.type().Resolved().kind();
+    void NoteCarriedType(const PropertyFacts& facts, const PropertyValue& value) {
         const Bytes& bytes = value.bytes();
-        if ((kind == TypeKind::Indirect || kind == TypeKind::Opaque) && bytes.size() > kIdSize) {
-            const GUID id = GuidOf(Bytes(bytes.begin() + 1, bytes.begin() + 1 + kIdSize));
-            if (model_.FindType(id) != nullptr) {
-                closure_.AddType(id);
-            }
+        if (!facts.carriesType || bytes.size() <= kIdSize) {
+            return;
+        }
+        TakeAlong(value);
+        StoredAuid id;
+        std::copy_n(bytes.begin() + 1, kIdSize, id.begin());
+        if (model_.FindType(GuidOf(id)) != nullptr) {
+            closure_.AddType(GuidOf(id));
         }
     }
 
     // Readers want the collections that a class requires, and an (empty) set
     // of essence data; an object that is required and absent stops them.
-    void AddRequired(const Object& from, StoredObject& out, PropertyId leftOut) {
-        for (const PropertyDefinition* definition : RequiredObjects(from.classDefinition())) {
+    void AddRequired(const ClassFacts& facts, StoredObject& out, PropertyId leftOut) {
+        for (const PropertyDefinition* definition : facts.required) {
             if (definition->pid() == leftOut || out.Find(definition->pid()) != nullptr) {
                 continue;
             }
             StoredProperty empty = EmptyProperty(*definition);
             if (empty.form == StoredForm::StrongReference) {
-                throw StoredError(ToUtf8(from.classDefinition().name()) + " has no " +
+                throw StoredError(ToUtf8(facts.definition->name()) + " has no " +
                                   ToUtf8(definition->name()));
             }
             out.properties.push_back(std::move(empty));
         }
     }
 
-    const std::vector<const PropertyDefinition*>& RequiredObjects(ClassDefinition& definition) {
-        const auto known = required_.find(&definition);
-        if (known != required_.end()) {
-            return known->second;
-        }
-        std::vector<const PropertyDefinition*>& out = required_[&definition];
-        for (ClassDefinition* at = &definition; at != nullptr; at = at->parent()) {
-            for (const RefPtr<PropertyDefinition>& property : at->properties()) {
-                const bool wanted = !property->IsOptional() ||
-                                    property->id() == prop::ContentStorage_EssenceData.id;
-                if (!wanted || property->type() == nullptr) {
-                    continue;
-                }
-                const StoredForm form = StoredFormOf(*property->type());
-                if (form == StoredForm::StrongReference || form == StoredForm::StrongVector ||
-                    form == StoredForm::StrongSet) {
-                    out.push_back(property.get());
-                }
+    static std::vector<const PropertyDefinition*> RequiredObjects(ClassDefinition& definition) {
+        std::vector<const PropertyDefinition*> out;
+        for (const PropertyDefinition* property :
+             definition.RequiredProperties(prop::ContentStorage_EssenceData.id)) {
+            const TypeDefinition* const type = property->type();
+            const StoredForm form = type == nullptr ? StoredForm::Data : StoredFormOf(*type);
+            if (form == StoredForm::StrongReference || form == StoredForm::StrongVector ||
+                form == StoredForm::StrongSet) {
+                out.push_back(property);
             }
         }
         return out;
@@ -263,11 +360,12 @@ private:
     // the sets are gone through until nothing is added.
     StoredObject StoredDictionary(const Dictionary& from) {
         StoredObject out;
-        out.classId = AuidOf(from.classId());
-        closure_.AddClass(from.classId());
+        ClassFacts& facts = FactsOfClass(from);
+        out.classId = facts.id;
         for (const auto& [pid, value] : from.MadeValues()) {
             if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
-                out.properties.push_back(StoredPropertyOf(from, pid, *value));
+                out.properties.push_back(
+                    StoredPropertyOf(FactsOfProperty(facts, from, pid), *value));
             }
         }
         std::map<PropertyId, StoredProperty> sets;
@@ -351,18 +449,20 @@ private:
     Model& model_;
     MetaClosure closure_;
     const MetaDictionary metaDictionary_;
+    const Object* replaced_ = nullptr;
+    const Object* content_ = nullptr;
     std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
-    std::map<const ClassDefinition*, std::vector<const PropertyDefinition*>> required_;
+    std::unordered_map<const ClassDefinition*, ClassFacts> classes_;
 };
 
 }  // namespace
 
 StoredObject TreeOfModel(Model& model, Object& header) {
-    return ModelWriter(model, StoredMetaDictionary).Write(header);
+    return ModelWriter(model, StoredMetaDictionary).Write(header, nullptr);
 }
 
-StoredObject TreeToWrite(Model& model, Object& header) {
-    return ModelWriter(model, LaidOutMetaDictionary).Write(header);
+StoredObject TreeToWrite(Model& model, Object& header, const Object* content) {
+    return ModelWriter(model, LaidOutMetaDictionary).Write(header, content);
 }
 
 }  // namespace aaf::stored

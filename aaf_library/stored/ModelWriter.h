@@ -19,7 +19,8 @@ namespace aaf::stored {
 // such as a slot its segment.
 StoredObject TreeOfModel(Model& model, Object& header);
 // The same for WriteTree alone: definitions that files have in common are there as they are laid
-// out, not as properties.
-StoredObject TreeToWrite(Model& model, Object& header);
+// out, not as properties. The content, unless null, stands in place of the header's own. It may be
+// of another model: what it needs of definitions is registered with this one.
+StoredObject TreeToWrite(Model& model, Object& header, const Object* content = nullptr);
 
 }  // namespace aaf::stored

@@ -56,12 +56,14 @@ public:
         }
     }
 
-    bool Write(const Bytes& bytes) {
+    bool Write(const std::vector<Bytes>& pieces) {
         errno = 0;
         std::ofstream out(path_, std::ios::binary | std::ios::trunc);
         exists_ = out.is_open();
-        out.write(reinterpret_cast<const char*>(bytes.data()),
-                  static_cast<std::streamsize>(bytes.size()));
+        for (const Bytes& bytes : pieces) {
+            out.write(reinterpret_cast<const char*>(bytes.data()),
+                      static_cast<std::streamsize>(bytes.size()));
+        }
         out.close();
         return exists_ && !out.fail();
     }
@@ -78,9 +80,9 @@ private:
     bool exists_ = false;
 };
 
-FileResult ReplaceFile(const Bytes& bytes, const std::filesystem::path& path) {
+FileResult ReplaceFile(const std::vector<Bytes>& pieces, const std::filesystem::path& path) {
     TemporaryFile temporary(path);
-    if (!temporary.Write(bytes)) {
+    if (!temporary.Write(pieces)) {
         return SystemFailure(path, "cannot be written");
     }
     if (const std::error_code problem = temporary.MoveTo(path)) {
@@ -133,7 +135,7 @@ bool CarriesSignature(const std::uint8_t* header, std::size_t size, SectorSize* 
 FileResult SaveTree(const StoredObject& root, const std::filesystem::path& path,
                     SectorSize sectorSize) {
     try {
-        return ReplaceFile(WriteTree(root, sectorSize), path);
+        return ReplaceFile(WriteTreeInPieces(root, sectorSize), path);
     } catch (const StoredError& problem) {
         return Failed(FileFailure::NotStorable, path, problem.what());
     } catch (const std::bad_alloc&) {

@@ -48,7 +48,9 @@ std::u16string IndexName(const std::u16string& collection) {
 }
 
 std::u16string ElementName(const std::u16string& collection, std::uint32_t localKey) {
-    return collection + u'{' + Hexadecimal(localKey) + u'}';
+    std::u16string name;
+    name.reserve(collection.size() + 10);
+    return name.append(collection).append(1, u'{').append(Hexadecimal(localKey)).append(1, u'}');
 }
 
 std::u16string PropertyPart(const std::u16string& storedName, std::uint16_t pid) {

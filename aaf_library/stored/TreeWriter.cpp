@@ -7,8 +7,10 @@
 #include "aaf_library/stored/StoredNames.h"
 
 #include <algorithm>
+#include <deque>
 #include <map>
 #include <numeric>
+#include <optional>
 
 // An object becomes a storage with a stream "properties":
 //
@@ -96,22 +98,34 @@ struct Layout {
     std::vector<Child> children;
     std::vector<Stream> streams;
 
-    void Add(const StoredProperty& property, const Bytes& value) {
-        if (value.size() > kLargestValue) {
-            throw StoredError(std::to_string(value.size()) + " bytes, a value may take " +
+    // The value is what `append` writes.
+    template <class Append>
+    void Add(const StoredProperty& property, const Append& append) {
+        const std::size_t before = values.bytes().size();
+        append(values);
+        const std::size_t size = values.bytes().size() - before;
+        if (size > kLargestValue) {
+            throw StoredError(std::to_string(size) + " bytes, a value may take " +
                               std::to_string(kLargestValue));
         }
         entries.AppendNumber(property.pid)
             .AppendNumber(static_cast<std::uint16_t>(property.form))
-            .AppendNumber(static_cast<std::uint16_t>(value.size()));
-        values.Append(value);
+            .AppendNumber(static_cast<std::uint16_t>(size));
         ++count;
     }
-};
+    void AddName(const StoredProperty& property, const std::u16string& name) {
+        Add(property, [&](ByteWriter& value) { value.AppendText(name); });
+    }
 
-Bytes NameValue(const std::u16string& name) {
-    return ByteWriter().AppendText(name).bytes();
-}
+    // Keeps its room.
+    void Clear() {
+        entries.Clear();
+        values.Clear();
+        count = 0;
+        children.clear();
+        streams.clear();
+    }
+};
 
 std::uint8_t CheckedKeySize(const StoredProperty& property) {
     if (!IsKeySize(property.keySize)) {
@@ -129,12 +143,12 @@ class TreeWriter {
 public:
     explicit TreeWriter(SectorSize sectorSize) : file_(sectorSize) {}
 
-    Bytes Write(const StoredObject& root) {
+    CompoundFileWriter& Write(const StoredObject& root) {
         Fill(CompoundFileWriter::kRoot, root, 0);
         // Tags are handed out on the way, so the table comes last. Readers
         // want it, even without a path in it.
         file_.AddStream(CompoundFileWriter::kRoot, kReferencedPropertiesStream, paths_.Table());
-        return file_.Finish();
+        return file_;
     }
 
     std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
@@ -152,17 +166,11 @@ private:
         if (depth > kMaximumDepth) {
             throw StoredError("objects are nested too deep");
         }
-        Layout layout;
-        std::vector<std::uint16_t> pids;
-        pids.reserve(object.properties.size());
-        for (const StoredProperty& property : object.properties) {
-            pids.push_back(property.pid);
-        }
-        std::sort(pids.begin(), pids.end());
-        const auto twice = std::adjacent_find(pids.begin(), pids.end());
+        Layout& layout = LayoutFor(depth);
+        const std::optional<std::uint16_t> twice = PidThatOccursTwice(object);
         for (const StoredProperty& property : object.properties) {
             try {
-                if (twice != pids.end() && property.pid == *twice) {
+                if (property.pid == twice) {
                     throw StoredError("occurs twice in one object");
                 }
                 AddProperty(layout, property);
@@ -173,16 +181,35 @@ private:
         WriteLayout(storage, object, layout, depth);
     }
 
+    // One for each depth: those of the holders are still being gone through.
+    Layout& LayoutFor(int depth) {
+        const auto at = static_cast<std::size_t>(depth);
+        while (layouts_.size() <= at) {
+            layouts_.emplace_back();
+        }
+        layouts_[at].Clear();
+        return layouts_[at];
+    }
+
+    std::optional<std::uint16_t> PidThatOccursTwice(const StoredObject& object) {
+        pids_.clear();
+        for (const StoredProperty& property : object.properties) {
+            pids_.push_back(property.pid);
+        }
+        std::sort(pids_.begin(), pids_.end());
+        const auto twice = std::adjacent_find(pids_.begin(), pids_.end());
+        return twice == pids_.end() ? std::nullopt : std::make_optional(*twice);
+    }
+
     void WriteLayout(Storage storage, const StoredObject& object, const Layout& layout, int depth) {
         file_.SetClass(storage, object.classId);
-        file_.AddStream(storage, kPropertiesStream,
-                        ByteWriter()
-                            .AppendNumber(kLittleEndianMark)
-                            .AppendNumber(kPropertiesVersion)
-                            .AppendNumber(static_cast<std::uint16_t>(layout.count))
-                            .Append(layout.entries.bytes())
-                            .Append(layout.values.bytes())
-                            .bytes());
+        properties_.Clear();
+        properties_.AppendNumber(kLittleEndianMark)
+            .AppendNumber(kPropertiesVersion)
+            .AppendNumber(static_cast<std::uint16_t>(layout.count))
+            .Append(layout.entries.bytes())
+            .Append(layout.values.bytes());
+        file_.AddStream(storage, propertiesName_, properties_.bytes());
         for (const Layout::Stream& stream : layout.streams) {
             file_.AddStream(storage, stream.name, stream.borrowed ? *stream.borrowed : stream.made);
         }
@@ -220,7 +247,7 @@ private:
                 break;
         }
         if (!property.bytes.empty()) {
-            layout.Add(property, property.bytes);
+            layout.Add(property, [&](ByteWriter& value) { value.Append(property.bytes); });
         }
     }
 
@@ -230,7 +257,7 @@ private:
                               std::to_string(property.objects.size()));
         }
         const std::u16string name = SingleName(property.name, property.pid);
-        layout.Add(property, NameValue(name));
+        layout.AddName(property, name);
         layout.children.push_back({name, &property.objects.front()});
     }
 
@@ -243,8 +270,8 @@ private:
             index.AppendNumber(i);
             layout.children.push_back({ElementName(name, i), &property.objects[i]});
         }
-        layout.Add(property, NameValue(name));
-        layout.streams.push_back({IndexName(name), index.bytes(), nullptr});
+        layout.AddName(property, name);
+        layout.streams.push_back({IndexName(name), index.Take(), nullptr});
     }
 
     static void AddStrongSet(Layout& layout, const StoredProperty& property) {
@@ -264,8 +291,8 @@ private:
             index.AppendNumber(i).AppendNumber(kSetReferenceCount).Append(key);
             layout.children.push_back({ElementName(name, i), &object});
         }
-        layout.Add(property, NameValue(name));
-        layout.streams.push_back({IndexName(name), index.bytes(), nullptr});
+        layout.AddName(property, name);
+        layout.streams.push_back({IndexName(name), index.Take(), nullptr});
     }
 
     // The places of the elements in the order of their keys, which are unique.
@@ -292,12 +319,12 @@ private:
             throw StoredError("a weak reference has one key, not " +
                               std::to_string(property.keys.size()));
         }
-        layout.Add(property, ByteWriter()
-                                 .AppendNumber(paths_.tag(property.targetPath))
-                                 .AppendNumber(property.keyPid)
-                                 .AppendNumber(CheckedKeySize(property))
-                                 .Append(property.keys.front())
-                                 .bytes());
+        const std::uint16_t tag = paths_.tag(property.targetPath);
+        const std::uint8_t keySize = CheckedKeySize(property);
+        layout.Add(property, [&](ByteWriter& value) {
+            value.AppendNumber(tag).AppendNumber(property.keyPid).AppendNumber(keySize);
+            value.Append(property.keys.front());
+        });
     }
 
     void AddWeakCollection(Layout& layout, const StoredProperty& property) {
@@ -312,8 +339,8 @@ private:
         for (const Bytes& key : InOrder(property)) {
             index.Append(key);
         }
-        layout.Add(property, NameValue(name));
-        layout.streams.push_back({IndexName(name), index.bytes(), nullptr});
+        layout.AddName(property, name);
+        layout.streams.push_back({IndexName(name), index.Take(), nullptr});
     }
 
     static std::vector<Bytes> InOrder(const StoredProperty& property) {
@@ -332,18 +359,28 @@ private:
             return;
         }
         const std::u16string name = SingleName(property.name, property.pid);
-        layout.Add(property, ByteWriter().AppendNumber(kStreamMark).AppendText(name).bytes());
+        layout.Add(property,
+                   [&](ByteWriter& value) { value.AppendNumber(kStreamMark).AppendText(name); });
         layout.streams.push_back({name, {}, &property.bytes});
     }
 
     CompoundFileWriter file_;
     TargetPaths paths_;
+    // Kept for their room.
+    std::deque<Layout> layouts_;
+    std::vector<std::uint16_t> pids_;
+    ByteWriter properties_;
+    const std::u16string propertiesName_ = kPropertiesStream;
 };
 
 }  // namespace
 
 Bytes WriteTree(const StoredObject& root, SectorSize sectorSize) {
-    return TreeWriter(sectorSize).Write(root);
+    return TreeWriter(sectorSize).Write(root).Finish();
+}
+
+std::vector<Bytes> WriteTreeInPieces(const StoredObject& root, SectorSize sectorSize) {
+    return TreeWriter(sectorSize).Write(root).FinishPieces();
 }
 
 std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,

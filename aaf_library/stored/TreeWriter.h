@@ -12,6 +12,8 @@ namespace aaf::stored {
 // since readers take an entry without bytes amiss; sets are written in the
 // order of their keys. The same tree gives the same bytes. Throws StoredError.
 Bytes WriteTree(const StoredObject& root, SectorSize sectorSize);
+// The same in pieces, which follow each other.
+std::vector<Bytes> WriteTreeInPieces(const StoredObject& root, SectorSize sectorSize);
 
 using TargetPath = std::vector<std::uint16_t>;
 

@@ -88,10 +88,7 @@ constexpr Letters kLetters[] = {
 
 }  // namespace
 
-char16_t UpperCase(char16_t unit) {
-    if (unit < 0x80) {
-        return unit >= u'a' && unit <= u'z' ? static_cast<char16_t>(unit - u'a' + u'A') : unit;
-    }
+char16_t UpperCaseBeyondAscii(char16_t unit) {
     const Letters* const found =
         std::lower_bound(std::begin(kLetters), std::end(kLetters), unit,
                          [](const Letters& letters, char16_t c) { return letters.last < c; });

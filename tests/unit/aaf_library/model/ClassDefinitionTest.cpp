@@ -19,6 +19,25 @@ TEST_F(ClassDefinitions, LookupSearchesParentsButNotSubclasses) {
     EXPECT_EQ(Class(AUID_AAFMob)->LookupPropertyDef(kOwnId, nullptr), AAFRESULT_NULL_PARAM);
 }
 
+TEST_F(ClassDefinitions, RequiredPropertiesAreThoseOfAllParentsAndTheOneAskedFor) {
+    aaf::ClassDefinition& slots = *model->FindClass(AUID_AAFTimelineMobSlot);
+    const auto idsWith = [&](const GUID& andThis) {
+        std::vector<GUID> ids;
+        for (const aaf::PropertyDefinition* property : slots.RequiredProperties(andThis)) {
+            ids.push_back(property->id());
+        }
+        return ids;
+    };
+    const std::vector<GUID> required = {aaf::prop::TimelineMobSlot_EditRate.id,
+                                        aaf::prop::TimelineMobSlot_Origin.id,
+                                        aaf::prop::MobSlot_SlotID.id, aaf::prop::MobSlot_Segment.id,
+                                        aaf::prop::InterchangeObject_ObjClass.id};
+    EXPECT_EQ(idsWith(kOwnId), required);
+    std::vector<GUID> withName = required;
+    withName.insert(withName.begin() + 3, aaf::prop::MobSlot_SlotName.id);
+    EXPECT_EQ(idsWith(aaf::prop::MobSlot_SlotName.id), withName);
+}
+
 TEST_F(ClassDefinitions, NewOptionalPropertyIsOptionalNotUniqueAndFound) {
     const auto type = Type(kAAFTypeID_Int32);
     const auto property = Out(Class(AUID_AAFMob), &IAAFClassDef::RegisterOptionalPropertyDef,

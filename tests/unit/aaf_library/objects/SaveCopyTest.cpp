@@ -3,8 +3,10 @@
 #include <cstring>
 #include <filesystem>
 #include <fstream>
+#include <functional>
 #include <iterator>
 
+#include "aaf_library/model/PropertyKeys.h"
 #include "host_interfaces/aaf/AAFComponents.h"
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
@@ -130,6 +132,131 @@ TEST_F(SaveCopy, GivesEqualFilesOfEqualClipsWhileTimeIsPinned) {
     const std::string first = Content(Path("a.aaf"));
     EXPECT_FALSE(first.empty());
     EXPECT_TRUE(first == Content(Path("b.aaf")));
+}
+
+// The target takes its copy late. What it saves of that is what was saved before, byte for byte,
+// whatever has become of the source.
+class TargetOfACopy : public SaveCopy {
+protected:
+    TargetOfACopy() {
+        const aafTimeStamp_t time{{2026, 1, 2}, {3, 4, 5, 0}};
+        const aafUID_t generation = ncfGuid("ABCDEF00-0000-0000-0000-000000000005");
+        EXPECT_EQ(AAFRESULT_SUCCESS, AAFCliphostPinTime(&time, &generation));
+        DescribeClip();
+        target_ = NewFile(path_);
+    }
+
+    void ExpectItKeepsWhatWasSavedWhen(const char* what, const std::function<void()>& change) {
+        SCOPED_TRACE(what);
+        ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target_));
+        const std::string saved = Content(path_);
+        change();
+        ASSERT_EQ(AAFRESULT_SUCCESS, target_->Save());
+        EXPECT_FALSE(saved.empty());
+        EXPECT_TRUE(saved == Content(path_));
+    }
+    void ExpectThreeMobs(IAAFFile* file) {
+        Ptr<IAAFHeader> header;
+        ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
+        aafNumSlots_t count = 0;
+        EXPECT_EQ(AAFRESULT_SUCCESS, header->CountMobs(kAAFAllMob, &count));
+        EXPECT_EQ(3u, count);
+        Ptr<IAAFMob> master = Get(header, &IAAFHeader::LookupMob, MobId(0x01));
+        EXPECT_EQ(L"A001", TextOf<IAAFMob>(master, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
+    }
+
+    const std::wstring path_ = Path("target.aaf");
+    Ptr<IAAFFile> target_;
+};
+
+TEST_F(TargetOfACopy, SavesTheSameAgain) {
+    ExpectItKeepsWhatWasSavedWhen("nothing", [] {});
+}
+
+TEST_F(TargetOfACopy, KeepsAValueThatChanges) {
+    ExpectItKeepsWhatWasSavedWhen(
+        "name", [&] { EXPECT_EQ(AAFRESULT_SUCCESS, master_->SetName(L"later")); });
+    ExpectThreeMobs(target_);
+}
+
+TEST_F(TargetOfACopy, LacksAnObjectThatJoinsASetAtItsEnd) {
+    Ptr<IAAFMob> late = FileMob(0xF1);
+    ExpectItKeepsWhatWasSavedWhen("mob",
+                                  [&] { EXPECT_EQ(AAFRESULT_SUCCESS, header_->AddMob(late)); });
+    ExpectThreeMobs(target_);
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, header_->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(4u, count);
+}
+
+TEST_F(TargetOfACopy, KeepsAnObjectThatGoes) {
+    ExpectItKeepsWhatWasSavedWhen(
+        "mob", [&] { EXPECT_EQ(AAFRESULT_SUCCESS, header_->RemoveMob(source_)); });
+    ExpectThreeMobs(target_);
+}
+
+TEST_F(TargetOfACopy, KeepsAValueThatGoes) {
+    Ptr<IAAFClassDef> mobs = Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFMob);
+    Ptr<IAAFPropertyDef> name;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mobs->LookupPropertyDef(aaf::prop::Mob_Name.id, name.Out()));
+    ExpectItKeepsWhatWasSavedWhen("name", [&] {
+        EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(master_)->RemoveOptionalProperty(name));
+    });
+    ExpectThreeMobs(target_);
+}
+
+TEST_F(TargetOfACopy, OutlivesTheSource) {
+    ExpectItKeepsWhatWasSavedWhen("file", [&] { EXPECT_EQ(AAFRESULT_SUCCESS, file_->Close()); });
+    ExpectThreeMobs(target_);
+}
+
+TEST_F(TargetOfACopy, MayBeClosedFirst) {
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target_));
+    EXPECT_EQ(AAFRESULT_SUCCESS, target_->Close());
+    EXPECT_EQ(AAFRESULT_SUCCESS, master_->SetName(L"later"));
+    Ptr<IAAFHeader> header;
+    EXPECT_EQ(AAFRESULT_NOT_OPEN, target_->GetHeader(header.Out()));
+}
+
+TEST_F(TargetOfACopy, IsACopyWhenItIsLookedAt) {
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target_));
+    ExpectThreeMobs(target_);
+    Ptr<IAAFHeader> header = Get(target_, &IAAFFile::GetHeader);
+    Ptr<IAAFMob> master = Get(header, &IAAFHeader::LookupMob, MobId(0x01));
+    EXPECT_NE(master_.get(), master.get());
+    EXPECT_EQ(AAFRESULT_SUCCESS, master->SetName(L"of the target"));
+    ExpectThreeMobs(file_);
+}
+
+TEST_F(TargetOfACopy, ShowsItsMobsToWhoHeldItsHeaderBefore) {
+    Ptr<IAAFHeader> header = Get(target_, &IAAFFile::GetHeader);
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target_));
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, header->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(3u, count);
+}
+
+TEST_F(TargetOfACopy, CanBeCopiedItself) {
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target_));
+    const std::wstring path = Path("second.aaf");
+    Ptr<IAAFFile> second = NewFile(path);
+    ASSERT_EQ(AAFRESULT_SUCCESS, target_->SaveCopyAs(second));
+    EXPECT_TRUE(Content(path_) == Content(path));
+    ExpectThreeMobs(second);
+}
+
+TEST_F(TargetOfACopy, SeveralTargetsOfOneSourceKeepTheirs) {
+    Ptr<IAAFFile> second = NewFile(Path("second.aaf"));
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(second));
+    ExpectItKeepsWhatWasSavedWhen(
+        "name", [&] { EXPECT_EQ(AAFRESULT_SUCCESS, master_->SetName(L"later")); });
+    ExpectThreeMobs(second);
+}
+
+TEST_F(TargetOfACopy, HoldsTheMobsWhereItCanNotBeWritten) {
+    Ptr<IAAFFile> target = NewFile(Path("no such folder/x.aaf"));
+    EXPECT_EQ(AAFRESULT_FILE_NOT_FOUND, file_->SaveCopyAs(target));
+    ExpectThreeMobs(target);
 }
 
 TEST_F(SaveCopy, NeedsATargetWithoutMobs) {

@@ -2,12 +2,14 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/StoredFile.h"
 
+#include "aaf_library/stored/TreeWriter.h"
 #include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>
 #include <unistd.h>
 #include <fstream>
+#include <iterator>
 
 using namespace aaf::stored;
 namespace fs = std::filesystem;
@@ -35,6 +37,17 @@ TEST_F(StoredFile, SavesAndLoadsATreeUnderAnyName) {
     ASSERT_TRUE(result) << result.message;
     EXPECT_EQ(loaded, tree);
     EXPECT_EQ(FileCount(), 1u);
+}
+
+TEST_F(StoredFile, HoldsTheTreeAsItIsLaidOut) {
+    // One stream is long, so that no part of the file is empty.
+    const StoredObject tree = sample::EveryForm();
+    for (const SectorSize size : {SectorSize::Bytes512, SectorSize::Bytes4096}) {
+        ASSERT_TRUE(SaveTree(tree, folder_ / "tree.aaf", size));
+        std::ifstream in(folder_ / "tree.aaf", std::ios::binary);
+        const Bytes content{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+        EXPECT_EQ(content, WriteTree(tree, size));
+    }
 }
 
 TEST_F(StoredFile, TellsTheKindOfAnAafFile) {
