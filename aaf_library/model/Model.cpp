@@ -236,10 +236,7 @@ HRESULT Model::RegisterClass(ClassDefinition& definition) {
     if (!definition.IsInitialized()) {
         return AAFRESULT_NOT_INITIALIZED;
     }
-    if (definition.IsRegistered()) {
-        return AAFRESULT_OBJECT_ALREADY_ATTACHED;
-    }
-    if (FindClass(definition.id()) != nullptr) {
+    if (definition.IsRegistered() || FindClass(definition.id()) != nullptr) {
         return AAFRESULT_SUCCESS;
     }
     Enter(RefPtr<ClassDefinition>(&definition));

@@ -79,7 +79,7 @@ HRESULT TypeEnumeration::CreateValueFromName(aafCharacter_constptr name,
         return AAFRESULT_NOT_INITIALIZED;
     }
     for (const Member& member : members_) {
-        if (member.name == name) {
+        if (IsSameElementName(member.name, name)) {
             Bytes stored;
             AppendNumber(static_cast<std::uint64_t>(member.value), StoredSize(), stored);
             return GiveValue(*this, std::move(stored), propVal);

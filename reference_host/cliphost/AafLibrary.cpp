@@ -115,8 +115,10 @@ AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
             kExitCaller, file,
             fmt::format("the module would not find this AAF library: it asks the system for {}",
                         kAAFLibraryName),
-            fmt::format("give the file that name and start again with LD_LIBRARY_PATH={}",
-                        DisplayPath(std::filesystem::absolute(file).parent_path())));
+            fmt::format(
+                "name a folder that can be written to in TMPDIR, or give the file that name "
+                "and start again with LD_LIBRARY_PATH={}",
+                DisplayPath(std::filesystem::absolute(file).parent_path())));
     }
 }
 
