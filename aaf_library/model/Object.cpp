@@ -37,7 +37,7 @@ PropertyId Object::NumberOf(const PropertyKey& key) const {
 PropertyValue* Object::FindValue(const PropertyKey& key) const {
     Complete();
     const auto found = values_.find(NumberOf(key));
-    return found == values_.end() ? nullptr : found->second.get();
+    return found == values_.end() || found->second->asStored() ? nullptr : found->second.get();
 }
 
 HRESULT Object::RemoveValue(const PropertyKey& key) {
@@ -64,7 +64,11 @@ PropertyValue* Object::RequireValue(const PropertyKey& key) {
     RefPtr<PropertyValue> value = property->type()->NewValue();
     value->EnterObject(*this);
     PropertyValue* added = value.get();
-    values_[property->pid()] = std::move(value);
+    RefPtr<PropertyValue>& place = values_[property->pid()];
+    if (place) {
+        place->LeaveObject();  // one that is kept as stored
+    }
+    place = std::move(value);
     return added;
 }
 
@@ -85,6 +89,7 @@ HRESULT Object::PutValue(PropertyId pid, PropertyValue* value) {
         entering = value->type().NewValue();
         entering->BytesToChange() = value->bytes();
         entering->SetStreamByteOrder(value->streamByteOrder());
+        entering->KeepAsStored(value->asStored());
     }
     const HRESULT result = entering->EnterObject(*this);
     if (result < 0) {

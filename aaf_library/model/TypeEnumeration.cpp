@@ -20,6 +20,12 @@ HRESULT TypeEnumeration::Setup(const GUID& id, const std::wstring& name, TypeDef
     return result;
 }
 
+void TypeEnumeration::Redefine(TypeDefinition& element, TypeMembers members) {
+    element_ = &element;
+    model()->KeepType(element);
+    members_ = std::move(members);
+}
+
 bool TypeEnumeration::IsSignedElement() const {
     return static_cast<const TypeInteger&>(element_->Resolved()).IsSignedType();
 }

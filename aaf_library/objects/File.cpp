@@ -40,6 +40,9 @@ constexpr FailureCode kFailureCodes[] = {
 };
 
 HRESULT ResultOf(const stored::FileResult& result, HRESULT noAccess) {
+    for (const std::string& note : result.notes) {
+        TellDiagnostic(note);
+    }
     if (result) {
         return AAFRESULT_SUCCESS;
     }

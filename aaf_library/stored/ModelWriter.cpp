@@ -6,6 +6,7 @@
 #include "aaf_library/model/Dictionary.h"
 #include "aaf_library/model/Model.h"
 #include "aaf_library/model/TypeDefinition.h"
+#include "aaf_library/stored/KeptProperty.h"
 #include "aaf_library/stored/MetaClosure.h"
 #include "aaf_library/stored/MetaPids.h"
 #include "aaf_library/stored/ModelNames.h"
@@ -118,8 +119,7 @@ private:
         out.properties.reserve(from.values().size() + 2);
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
-                out.properties.push_back(
-                    StoredPropertyOf(FactsOfProperty(facts, from, entry.first), *entry.second));
+                out.properties.push_back(StoredPropertyOf(facts, from, entry.first, *entry.second));
             }
         }
         AddRequired(facts, out, leftOut);
@@ -160,6 +160,21 @@ private:
                 return known;
             }
         }
+        const PropertyDefinition& definition = DefinitionOf(facts, from, pid);
+        PropertyFacts& made = facts.properties.emplace_back();
+        made.from = pid;
+        made.definition = &definition;
+        made.empty = EmptyProperty(definition);
+        if (IsWeak(made.empty.form)) {
+            NameTargets(made);
+        }
+        const TypeKind kind = definition.type()->Resolved().kind();
+        made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
+        return made;
+    }
+
+    const PropertyDefinition& DefinitionOf(const ClassFacts& facts, const Object& from,
+                                           PropertyId pid) {
         const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
         const bool isHere = facts.definition == &from.classDefinition() && pid < kFirstLocalPid;
         if (definition != nullptr && from.model() != &model_ && !isHere) {
@@ -169,16 +184,54 @@ private:
         if (definition == nullptr || definition->type() == nullptr) {
             throw StoredError(PropertyText(pid) + " has no definition");
         }
-        PropertyFacts& made = facts.properties.emplace_back();
-        made.from = pid;
-        made.definition = definition;
-        made.empty = EmptyProperty(*definition);
-        if (IsWeak(made.empty.form)) {
-            NameTargets(made);
+        return *definition;
+    }
+
+    StoredProperty StoredPropertyOf(ClassFacts& facts, const Object& from, PropertyId pid,
+                                    const PropertyValue& value) {
+        return value.asStored() ? AsItStands(DefinitionOf(facts, from, pid), value)
+                                : StoredPropertyOf(FactsOfProperty(facts, from, pid), value);
+    }
+
+    // What a file held in place of a value, with the numbers that this one has.
+    StoredProperty AsItStands(const PropertyDefinition& definition, const PropertyValue& value) {
+        const auto& kept = static_cast<const KeptProperty&>(*value.asStored());
+        TakeAlong(value);
+        for (const auto& [set, id] : kept.targets) {
+            if (model_.dictionary().FindDefinition(set, id) != nullptr) {
+                const StoredAuid key = AuidOf(id);
+                targets_[{meta::kRootHeader, prop::Header_Dictionary.pid, set}].insert(
+                    Bytes(key.begin(), key.end()));
+            }
         }
-        const TypeKind kind = definition->type()->Resolved().kind();
-        made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
-        return made;
+        StoredProperty out = kept.property;
+        out.pid = definition.pid();
+        if (!out.name.empty()) {
+            out.name = Utf16Of(definition.name());
+        } else if (!out.bytes.empty()) {
+            out.bytes = value.bytes();
+        }
+        ForEachObject(out, [&](StoredObject& object) {
+            if (const GUID id = GuidOf(object.classId); model_.FindClass(id) != nullptr) {
+                closure_.AddClass(id);
+            }
+            Renumber(object, kept.numbers);
+        });
+        return out;
+    }
+
+    void Renumber(StoredObject& object, const std::unordered_map<std::uint16_t, GUID>& numbers) {
+        std::vector<StoredProperty> known;
+        for (StoredProperty& property : object.properties) {
+            if (const auto local = numbers.find(property.pid); local != numbers.end()) {
+                const PropertyDefinition* const definition = model_.FindProperty(local->second);
+                property.pid = definition == nullptr ? kNoPropertyId : definition->pid();
+            }
+            if (property.pid != kNoPropertyId) {
+                known.push_back(std::move(property));
+            }
+        }
+        object.properties = std::move(known);
     }
 
     StoredProperty StoredPropertyOf(const PropertyFacts& facts, const PropertyValue& value) {
@@ -364,8 +417,7 @@ private:
         out.classId = facts.id;
         for (const auto& [pid, value] : from.MadeValues()) {
             if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
-                out.properties.push_back(
-                    StoredPropertyOf(FactsOfProperty(facts, from, pid), *value));
+                out.properties.push_back(StoredPropertyOf(facts, from, pid, *value));
             }
         }
         std::map<PropertyId, StoredProperty> sets;

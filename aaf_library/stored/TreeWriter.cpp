@@ -236,6 +236,13 @@ private:
                 return AddStrongVector(layout, property);
             case StoredForm::StrongSet:
                 return AddStrongSet(layout, property);
+            default:
+                break;
+        }
+        if (!property.problem.empty()) {
+            return AddAsItStands(layout, property);
+        }
+        switch (property.form) {
             case StoredForm::WeakReference:
                 return AddWeakReference(layout, property);
             case StoredForm::WeakVector:
@@ -243,11 +250,33 @@ private:
                 return AddWeakCollection(layout, property);
             case StoredForm::Stream:
                 return AddStream(layout, property);
-            case StoredForm::Data:
-                break;
+            default:
+                return AddData(layout, property);
         }
+    }
+
+    static void AddData(Layout& layout, const StoredProperty& property) {
         if (!property.bytes.empty()) {
             layout.Add(property, [&](ByteWriter& value) { value.Append(property.bytes); });
+        }
+    }
+
+    // Something that a reader made no sense of; so will others.
+    static void AddAsItStands(Layout& layout, const StoredProperty& property) {
+        const bool isStream = property.form == StoredForm::Stream;
+        if (property.name.empty()) {
+            return AddData(layout, property);
+        }
+        const std::u16string name = isStream ? SingleName(property.name, property.pid)
+                                             : CollectionName(property.name, property.pid);
+        layout.Add(property, [&](ByteWriter& value) {
+            if (isStream) {
+                value.AppendNumber(kStreamMark);
+            }
+            value.AppendText(name);
+        });
+        if (!property.bytes.empty()) {
+            layout.streams.push_back({isStream ? name : IndexName(name), {}, &property.bytes});
         }
     }
 
@@ -285,7 +314,8 @@ private:
             const StoredObject& object = property.objects[order[i]];
             const Bytes& key = property.keys[order[i]];
             const StoredProperty* stored = object.Find(property.keyPid);
-            if (stored == nullptr || stored->bytes != key) {
+            const bool hasKey = stored != nullptr && stored->bytes == key;
+            if (!hasKey && property.problem.empty()) {
                 throw StoredError("an element does not store its key");
             }
             index.AppendNumber(i).AppendNumber(kSetReferenceCount).Append(key);

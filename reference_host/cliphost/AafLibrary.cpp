@@ -10,6 +10,7 @@
 #include "host_interfaces/Version.h"
 #include "host_interfaces/aaf/AAFResultCodes.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/PrivateFile.h"
@@ -34,21 +35,21 @@ std::wstring WideName(const std::filesystem::path& path) {
     return encodings::ToWideLossy(host::system::FromSystemPath(path));
 }
 
-// Keeps the last sentence that the library writes for people, while this lives.
-class LibrarySentence final : public IAAFDiagnosticOutput {
+// Keeps the sentences that the library writes for people, while this lives.
+class LibrarySentences final : public IAAFDiagnosticOutput {
 public:
-    explicit LibrarySentence(AAFSetDiagnosticOutputFunction set) : set_(set) {
+    explicit LibrarySentences(AAFSetDiagnosticOutputFunction set) : set_(set) {
         if (set_) {
             set_(this);
         }
     }
-    ~LibrarySentence() {
+    ~LibrarySentences() {
         if (set_) {
             set_(nullptr);
         }
     }
-    LibrarySentence(const LibrarySentence&) = delete;
-    LibrarySentence& operator=(const LibrarySentence&) = delete;
+    LibrarySentences(const LibrarySentences&) = delete;
+    LibrarySentences& operator=(const LibrarySentences&) = delete;
 
     HRESULT QueryInterface(REFIID, void** out) override {
         *out = nullptr;
@@ -58,15 +59,16 @@ public:
     ULONG AddRef() override { return 1; }
     ULONG Release() override { return 1; }
     HRESULT PutString(aafCharacter_constptr sentence) override {
-        text_ = Utf8(sentence);
+        all_.push_back(Utf8(sentence));
         return AAFRESULT_SUCCESS;
     }
 
-    const std::string& text() const { return text_; }
+    const std::vector<std::string>& all() const { return all_; }
+    std::string last() const { return all_.empty() ? std::string() : all_.back(); }
 
 private:
     AAFSetDiagnosticOutputFunction set_;
-    std::string text_;
+    std::vector<std::string> all_;
 };
 
 // How files name this program as their writer.
@@ -149,16 +151,16 @@ void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     const auto openNew = find<AAFFileOpenNewModifyExFunction>("AAFFileOpenNewModifyEx");
     ThisProgram program;
     OutputFile output(path, OutputFile::Writer::Other);
-    const LibrarySentence said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
+    const LibrarySentences said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
     const auto check = [&](HRESULT result, const char* step) {
         if (result >= 0) {
             return;
         }
-        if (const int error = SystemErrorIn(said.text())) {
+        if (const int error = SystemErrorIn(said.last())) {
             output.Fail(error);
         }
         output.TryPlace();
-        const std::string reason = said.text().empty() ? TextOfResult(result) : said.text();
+        const std::string reason = said.last().empty() ? TextOfResult(result) : said.last();
         throw Failure(
             kExitCaller, path,
             fmt::format(
@@ -194,10 +196,15 @@ host::Ref<IAAFFile> AafLibrary::OpenTransient() const {
 
 host::Ref<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
     const auto openRead = find<AAFFileOpenExistingReadFunction>("AAFFileOpenExistingRead");
+    const LibrarySentences said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
     host::Ref<IAAFFile> file;
     const HRESULT result = openRead(WideName(path).c_str(), 0, file.Out());
     if (result < 0) {
         throw Failure(kExitFile, path, "can't be read as AAF: " + TextOfResult(result));
+    }
+    // What the library read all the same.
+    for (const std::string& sentence : said.all()) {
+        Notice("cliphost: {}: {}\n", DisplayPath(path), sentence);
     }
     return file;
 }

@@ -535,7 +535,40 @@ ValueType* ValueReader::TypeOf(IAAFPropertyValue* value) {
     return known.get();
 }
 
+namespace {
+
+// A library gives a property that is no value of its type as bytes of no defined type.
+bool IsRaw(IAAFPropertyValue* value) {
+    aafBoolean_t isDefined = kAAFTrue;
+    return value != nullptr && value->IsDefinedType(&isDefined) >= 0 && isDefined == kAAFFalse;
+}
+
+std::string RawText(IAAFPropertyValue* value) {
+    host::Ref<IAAFTypeDef> type;
+    value->GetType(type.Out());
+    const auto array = As<IAAFTypeDefVariableArray>(type.get());
+    aafUInt32 count = 0;
+    if (!array || array->GetCount(value, &count) < 0) {
+        return kUnreadable;
+    }
+    std::vector<aafUInt8> bytes(std::max<aafUInt32>(count, 1));
+    if (array->GetCArray(value, bytes.data(), count) < 0) {
+        return kUnreadable;
+    }
+    std::string text = "raw bytes";
+    for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
+        text += ' ';
+        AppendHex(kLower, {bytes[i]}, text);
+    }
+    return count <= kMostElements ? text : text + fmt::format(" ... {} in all", count);
+}
+
+}  // namespace
+
 std::string ValueReader::Text(IAAFPropertyValue* value) {
+    if (IsRaw(value)) {
+        return RawText(value);
+    }
     ValueType* const type = TypeOf(value);
     return type == nullptr ? kUnreadable : type->Text(value);
 }
