@@ -82,14 +82,43 @@ function(test_code name)
   endif()
 endfunction()
 
-# project_test(NAME SOURCES file... LIBS target... [LABELS label...])
-# A GoogleTest program; each of its tests is one of ctest's.
-function(project_test name)
-  cmake_parse_arguments(ARG "" "" "SOURCES;LIBS;LABELS" ${ARGN})
+# test_program(NAME [IN_BATCHES] SOURCES file... LIBS target... [APART suite...] [FILTER pattern]
+#              [PROPERTIES name value ...])
+# A GoogleTest program, each of whose suites is one of ctest's rows. Of suites that fit one of the
+# regular expressions of APART each test is a row, and so a process, of its own: what they change
+# in their process would be there for their neighbours. IN_BATCHES: compiled as the libraries are,
+# because no two of its files give one name to two things.
+function(test_program name)
+  cmake_parse_arguments(ARG "IN_BATCHES" "FILTER" "SOURCES;LIBS;APART;PROPERTIES" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
+  if(CLIPHOST_BATCHES AND ARG_IN_BATCHES)
+    set_target_properties(${name} PROPERTIES UNITY_BUILD ON)
+  endif()
   test_code(${name})
-  target_link_libraries(${name} PRIVATE ${ARG_LIBS} GTest::gtest_main)
+  target_link_libraries(${name} PRIVATE ${ARG_LIBS} test_main)
   set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${PROJECT_BINARY_DIR}/tests)
-  gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60
-                       PROPERTIES TIMEOUT 300 LABELS "${ARG_LABELS}")
+  if(NOT ARG_FILTER)
+    set(ARG_FILTER "*")
+  endif()
+  set(base ${CMAKE_CURRENT_BINARY_DIR}/${name})
+  list(APPEND ARG_PROPERTIES TIMEOUT 300 WORKING_DIRECTORY ${CMAKE_CURRENT_BINARY_DIR})
+  file(GENERATE OUTPUT ${base}_program.cmake CONTENT "set(name ${name})
+set(program [==[$<TARGET_FILE:${name}>]==])
+set(rows [==[${base}_rows.cmake]==])
+set(apart [==[${ARG_APART}]==])
+set(filter [==[${ARG_FILTER}]==])
+set(properties [==[${ARG_PROPERTIES}]==])
+include([==[${PROJECT_SOURCE_DIR}/cmake/TestRows.cmake]==])
+")
+  set_property(DIRECTORY APPEND PROPERTY TEST_INCLUDE_FILES ${base}_program.cmake)
+endfunction()
+
+# project_test(NAME [IN_BATCHES] SOURCES file... LIBS target... [APART suite...] [LABEL label])
+# A program of unit tests.
+function(project_test name)
+  cmake_parse_arguments(ARG "" "LABEL" "" ${ARGN})
+  if(ARG_LABEL)
+    set(labels PROPERTIES LABELS ${ARG_LABEL})
+  endif()
+  test_program(${name} ${ARG_UNPARSED_ARGUMENTS} ${labels})
 endfunction()

@@ -139,10 +139,24 @@ std::u32string FromPairs(const Text& text) {
     return out;
 }
 
+// Most texts are ASCII, which every encoding holds in the same numbers.
+template <class Text>
+bool IsAscii(const Text& text) {
+    char32_t all = 0;
+    for (const auto unit : text) {
+        all |= static_cast<char32_t>(unit);  // a negative one becomes a large number
+    }
+    return all < 0x80;
+}
+
 // Runs `append` over all characters into a fresh text, handed over only when
 // every one had its place.
 template <class Text, class Append>
 bool Encode(std::u32string_view text, Text& out, Append append) {
+    if (IsAscii(text)) {
+        out.assign(text.begin(), text.end());
+        return true;
+    }
     Text made;
     made.reserve(text.size());
     for (const char32_t c : text) {
@@ -156,6 +170,9 @@ bool Encode(std::u32string_view text, Text& out, Append append) {
 
 template <class Text, class Append>
 Text EncodeLossy(std::u32string_view text, Append append) {
+    if (IsAscii(text)) {
+        return Text(text.begin(), text.end());
+    }
     Text made;
     made.reserve(text.size());
     for (const char32_t c : text) {
@@ -177,6 +194,9 @@ bool HoldsSurrogate(std::u32string_view text) {
 }
 
 std::u32string FromUtf8(std::string_view text) {
+    if (IsAscii(text)) {
+        return {text.begin(), text.end()};
+    }
     std::u32string out;
     out.reserve(text.size());
     std::size_t at = 0;

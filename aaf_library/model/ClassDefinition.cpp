@@ -27,10 +27,14 @@ void ClassDefinition::TakeBuiltIn(const BuiltInClass& entry) {
     properties_.resize(builtIn_.size());
     // Numbers that are the file's own are allotted in the order in which classes come.
     for (std::size_t index = 0; index < builtIn_.size(); ++index) {
-        if (builtIn_[index].key.pid == kNoPropertyId) {
-            PropertyAt(index);
-        }
+        const PropertyId pid = builtIn_[index].key.pid;
+        Cover(pid == kNoPropertyId ? PropertyAt(index)->pid() : pid);
     }
+}
+
+void ClassDefinition::Cover(PropertyId pid) {
+    lowest_ = std::min(lowest_, pid);
+    highest_ = std::max(highest_, pid);
 }
 
 bool ClassDefinition::IsKindOf(const GUID& classId) const {
@@ -102,7 +106,15 @@ PropertyDefinition* ClassDefinition::FindProperty(const GUID& id) {
 }
 
 PropertyDefinition* ClassDefinition::FindProperty(PropertyId pid) {
-    return FindWhere([pid](const Searched& property) { return property.pid == pid; });
+    for (ClassDefinition* at = this; at != nullptr; at = at->parent_) {
+        const bool mayHave = pid >= at->lowest_ && pid <= at->highest_;
+        for (std::size_t index = 0; mayHave && index < at->properties_.size(); ++index) {
+            if (at->SearchedAt(index).pid == pid) {
+                return at->PropertyAt(index);
+            }
+        }
+    }
+    return nullptr;
 }
 
 PropertyDefinition* ClassDefinition::FindUniqueProperty() {
@@ -132,6 +144,7 @@ PropertyDefinition& ClassDefinition::AddProperty(const GUID& id, const std::wstr
     property->SetPid(model()->EnterProperty(*property));
     property->Keep();
     PropertyDefinition& added = *property;
+    Cover(added.pid());
     properties_.push_back(std::move(property));
     return added;
 }

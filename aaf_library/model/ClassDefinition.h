@@ -79,11 +79,16 @@ private:
     HRESULT RegisterProperty(const GUID& id, aafCharacter_constptr name, IAAFTypeDef* typeDef,
                              bool optional, bool unique, IAAFPropertyDef** propDef);
 
+    void Cover(PropertyId pid);
+
     ClassDefinition* parent_ = nullptr;
     bool concrete_ = false;
     bool registered_ = false;
     Span<BuiltInProperty> builtIn_;
     std::vector<RefPtr<PropertyDefinition>> properties_;  // null: not looked up yet
+    // No property of its own has a number beyond these.
+    PropertyId lowest_ = 0xFFFF;
+    PropertyId highest_ = 0;
 };
 
 }  // namespace aaf

@@ -91,6 +91,7 @@ Object* Dictionary::FindDefinition(PropertyId set, const GUID& id) const {
 
 Object* Dictionary::FindMade(const PropertyKey& set, const GUID& id) const {
     Bytes key;
+    key.reserve(kGuidSize);
     AppendGuid(id, key);
     return FindInSet(set, key.data(), key.size());
 }

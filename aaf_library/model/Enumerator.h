@@ -2,18 +2,14 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <functional>
-
 #include "aaf_library/model/Object.h"
 
 namespace aaf {
 
-// Element of a list by index, null behind the end. It is asked anew each time,
+// An enumerator with the five operations that all of them share. ElementAt gives the
+// element of a list by index, null behind the end. It is asked anew each time,
 // so elements that are appended while an enumerator runs are met.
-using ElementAt = std::function<RefPtr<Unknown>(std::size_t index)>;
-
-// An enumerator with the five operations that all of them share.
-template <class EnumInterface, class ElementInterface>
+template <class EnumInterface, class ElementInterface, class ElementAt>
 class Enumerator : public Implements<Unknown, EnumInterface> {
 public:
     Enumerator(ElementAt elementAt, std::size_t position)
@@ -23,7 +19,7 @@ public:
         if (element == nullptr) {
             return AAFRESULT_NULL_PARAM;
         }
-        RefPtr<Unknown> next = elementAt_(position_);
+        const auto next = elementAt_(position_);
         if (!next) {
             return AAFRESULT_NO_MORE_OBJECTS;
         }
@@ -75,13 +71,13 @@ private:
     std::size_t position_;
 };
 
-template <class ElementInterface, class EnumInterface>
+template <class ElementInterface, class EnumInterface, class ElementAt>
 HRESULT MakeEnumerator(ElementAt elementAt, EnumInterface** out) {
     if (out == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    RefPtr<Enumerator<EnumInterface, ElementInterface>> made(
-        new Enumerator<EnumInterface, ElementInterface>(std::move(elementAt), 0));
+    using Made = Enumerator<EnumInterface, ElementInterface, ElementAt>;
+    RefPtr<Made> made(new Made(std::move(elementAt), 0));
     *out = made.Detach();
     return AAFRESULT_SUCCESS;
 }

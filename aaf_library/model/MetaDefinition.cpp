@@ -7,7 +7,7 @@
 namespace aaf {
 
 const std::wstring& MetaDefinition::name() const {
-    if (name_.empty() && builtInName_ != nullptr) {
+    if (IsNameInTable()) {
         name_ = Widen(builtInName_);
     }
     return name_;
@@ -64,11 +64,12 @@ HRESULT MetaDefinition::SetName(aafCharacter_constptr name) {
 }
 
 HRESULT MetaDefinition::GetName(aafCharacter* name, aafUInt32 bufSize) {
-    return CopyText(this->name(), name, bufSize);
+    return IsNameInTable() ? CopyAscii(builtInName_, name, bufSize)
+                           : CopyText(name_, name, bufSize);
 }
 
 HRESULT MetaDefinition::GetNameBufLen(aafUInt32* bufSize) {
-    return TextSize(name(), bufSize);
+    return IsNameInTable() ? AsciiSize(builtInName_, bufSize) : TextSize(name_, bufSize);
 }
 
 HRESULT MetaDefinition::SetDescription(aafCharacter_constptr description) {

@@ -43,6 +43,8 @@ protected:
     virtual bool NeedsNameOnly() const { return false; }
 
 private:
+    bool IsNameInTable() const { return name_.empty() && builtInName_ != nullptr; }
+
     GUID id_{};
     const char* builtInName_ = nullptr;  // until somebody asks for the name
     mutable std::wstring name_;

@@ -128,10 +128,13 @@ RefPtr<Object> Model::CreateObject(ClassDefinition& definition, bool withDefault
 }
 
 RefPtr<PropertyValue> Model::NewValue(TypeDefinition& type) {
+    return NewValue(type, type.EmptyBytes());
+}
+
+RefPtr<PropertyValue> Model::NewValue(TypeDefinition& type, Bytes bytes) {
     KeepType(type);
-    RefPtr<PropertyValue> value(new PropertyValue(type));
+    RefPtr<PropertyValue> value(new PropertyValue(type, std::move(bytes)));
     value->JoinModel(*this);
-    type.FillEmpty(*value);
     return value;
 }
 

@@ -44,8 +44,9 @@ public:
         RefPtr<Object> object = definition == nullptr ? nullptr : CreateObject(*definition);
         return RefPtr<T>(dynamic_cast<T*>(object.get()));
     }
-    // A value of this type, empty.
+    // A value of this type, empty or with these bytes.
     RefPtr<PropertyValue> NewValue(TypeDefinition& type);
+    RefPtr<PropertyValue> NewValue(TypeDefinition& type, Bytes bytes);
     // What IAAFDictionary::CreateInstance and IAAFClassDef::CreateInstance do.
     HRESULT CreateInstance(const GUID& classId, const GUID& iid, IUnknown** out);
     HRESULT CreateMetaInstance(const GUID& classId, const GUID& iid, IUnknown** out);

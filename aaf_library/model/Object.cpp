@@ -35,20 +35,16 @@ PropertyId Object::NumberOf(const PropertyKey& key) const {
 }
 
 PropertyValue* Object::FindValue(const PropertyKey& key) const {
-    Complete();
-    const auto found = values_.find(NumberOf(key));
-    return found == values_.end() || found->second->asStored() ? nullptr : found->second.get();
+    PropertyValue* const value = values().Find(NumberOf(key));
+    return value == nullptr || value->asStored() ? nullptr : value;
 }
 
 HRESULT Object::RemoveValue(const PropertyKey& key) {
-    const auto found = values_.find(NumberOf(key));
-    if (found == values_.end()) {
+    if (values().Find(NumberOf(key)) == nullptr) {
         return AAFRESULT_PROP_NOT_PRESENT;
     }
     model()->TellChange();
-    const RefPtr<PropertyValue> value = std::move(found->second);
-    values_.erase(found);
-    value->LeaveObject();
+    values_.Take(NumberOf(key))->LeaveObject();
     return AAFRESULT_SUCCESS;
 }
 
@@ -64,17 +60,14 @@ PropertyValue* Object::RequireValue(const PropertyKey& key) {
     RefPtr<PropertyValue> value = property->type()->NewValue();
     value->EnterObject(*this);
     PropertyValue* added = value.get();
-    RefPtr<PropertyValue>& place = values_[property->pid()];
-    if (place) {
-        place->LeaveObject();  // one that is kept as stored
+    if (const RefPtr<PropertyValue> old = values_.Put(property->pid(), std::move(value))) {
+        old->LeaveObject();  // one that is kept as stored
     }
-    place = std::move(value);
     return added;
 }
 
 HRESULT Object::PutValue(PropertyId pid, PropertyValue* value) {
-    const auto present = values_.find(pid);
-    if (present != values_.end() && present->second.get() == value) {
+    if (values_.Find(pid) == value) {
         return AAFRESULT_SUCCESS;
     }
     if (value->model() != model()) {
@@ -95,10 +88,7 @@ HRESULT Object::PutValue(PropertyId pid, PropertyValue* value) {
     if (result < 0) {
         return result;
     }
-    RefPtr<PropertyValue>& slot = values_[pid];
-    const RefPtr<PropertyValue> old = std::move(slot);
-    slot = std::move(entering);
-    if (old) {
+    if (const RefPtr<PropertyValue> old = values_.Put(pid, std::move(entering))) {
         old->LeaveObject();
     }
     return AAFRESULT_SUCCESS;
@@ -135,14 +125,18 @@ HRESULT Object::GetDefinition(IAAFClassDef** classDef) {
 
 HRESULT Object::GetProperties(IEnumAAFProperties** enumerator) {
     return MakeEnumerator<IAAFProperty>(
-        [self = RefPtr<Object>(this)](std::size_t index) -> RefPtr<Unknown> {
+        [self = RefPtr<Object>(this),
+         given = RefPtr<Property>()](std::size_t index) mutable -> RefPtr<Property> {
             if (index >= self->values().size()) {
                 return nullptr;
             }
-            const auto entry =
-                std::next(self->values().begin(), static_cast<std::ptrdiff_t>(index));
-            PropertyDefinition* property = self->class_->FindProperty(entry->first);
-            return RefPtr<Unknown>(new Property(*self, *property, *entry->second));
+            const auto& [pid, value] = self->values_.At(index);
+            // Who walks through them gives each back before the next.
+            if (!given || !given->IsHeldOnce()) {
+                given = new Property(*self);
+            }
+            given->Set(*self->class_->FindProperty(pid), *value);
+            return given;
         },
         enumerator);
 }
@@ -163,9 +157,8 @@ HRESULT Object::GetPropertyValue(IAAFPropertyDef* propDef, IAAFPropertyValue** p
     if (property == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
-    const auto found = values().find(property->pid());
-    return found == values_.end() ? AAFRESULT_PROP_NOT_PRESENT
-                                  : GiveOut(found->second.get(), propVal);
+    PropertyValue* const found = values().Find(property->pid());
+    return found == nullptr ? AAFRESULT_PROP_NOT_PRESENT : GiveOut(found, propVal);
 }
 
 HRESULT Object::SetPropertyValue(IAAFPropertyDef* propDef, IAAFPropertyValue* propVal) {
@@ -188,7 +181,7 @@ HRESULT Object::IsPropertyPresent(IAAFPropertyDef* propDef, aafBoolean_t* result
     if (property == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
-    *result = values().count(property->pid()) > 0 ? kAAFTrue : kAAFFalse;
+    *result = values().Find(property->pid()) != nullptr ? kAAFTrue : kAAFFalse;
     return AAFRESULT_SUCCESS;
 }
 
@@ -208,7 +201,7 @@ HRESULT Object::CreateOptionalPropertyValue(IAAFPropertyDef* propDef, IAAFProper
     if (property == nullptr || !property->IsOptional()) {
         return AAFRESULT_BAD_PROP;
     }
-    if (values().count(property->pid()) > 0) {
+    if (values().Find(property->pid()) != nullptr) {
         return AAFRESULT_PROP_ALREADY_PRESENT;
     }
     PropertyValue* value = RequireValue(property->key());

@@ -2,13 +2,13 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <map>
 #include <string>
 #include <vector>
 
 #include "aaf_library/model/PropertyKeys.h"
 #include "aaf_library/model/PropertyValue.h"
 #include "aaf_library/model/Unknown.h"
+#include "aaf_library/model/ValueList.h"
 #include "host_interfaces/aaf/AAFObjects.h"
 #include "not_implemented/AAFObjects.h"
 
@@ -55,8 +55,6 @@ class PropertyDefinition;
 // - MakeEnumerator in Enumerator.h gives enumerators over a property's live list.
 class Object : public Implements<Unknown, IAAFObject> {
 public:
-    using Values = std::map<PropertyId, RefPtr<PropertyValue>>;
-
     Object() = default;
 
     // -- What the object is and where it stands.
@@ -81,12 +79,12 @@ public:
     virtual bool BelongsToModel() const { return false; }
 
     // -- Values as they stand, ordered by number.
-    const Values& values() const {
+    const ValueList& values() const {
         Complete();
         return values_;
     }
     // The same, without those that come into being when they are wanted.
-    const Values& MadeValues() const { return values_; }
+    const ValueList& MadeValues() const { return values_; }
     PropertyValue* FindValue(const PropertyKey& key) const;
     bool IsPresent(const PropertyKey& key) const { return FindValue(key) != nullptr; }
     // Drops a value; absent: AAFRESULT_PROP_NOT_PRESENT.
@@ -224,7 +222,7 @@ private:
 
     ClassDefinition* class_ = nullptr;
     Object* owner_ = nullptr;
-    Values values_;
+    ValueList values_;
     bool generationTracked_ = false;
 };
 

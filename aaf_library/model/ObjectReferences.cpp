@@ -164,13 +164,19 @@ Object* Object::FindInSet(const PropertyKey& key, const void* keyBytes, std::siz
     if (value == nullptr) {
         return nullptr;
     }
-    const auto* first = static_cast<const std::uint8_t*>(keyBytes);
-    const Bytes wanted(first, first + size);
+    const auto* const first = static_cast<const std::uint8_t*>(keyBytes);
+    const auto* const last = first + size;
     const auto& elements = value->objects();
     const auto place =
-        std::lower_bound(elements.begin(), elements.end(), wanted,
-                         [](const RefPtr<Object>& at, const Bytes& id) { return KeyOf(*at) < id; });
-    return place != elements.end() && KeyOf(**place) == wanted ? place->get() : nullptr;
+        std::partition_point(elements.begin(), elements.end(), [&](const RefPtr<Object>& at) {
+            const Bytes& key = KeyOf(*at);
+            return std::lexicographical_compare(key.begin(), key.end(), first, last);
+        });
+    if (place == elements.end()) {
+        return nullptr;
+    }
+    const Bytes& found = KeyOf(**place);
+    return std::equal(found.begin(), found.end(), first, last) ? place->get() : nullptr;
 }
 
 void Object::SortSet(const PropertyKey& key) {

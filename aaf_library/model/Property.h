@@ -11,8 +11,11 @@ namespace aaf {
 // One property as an enumerator gives it: definition and value side by side.
 class Property : public Implements<Unknown, IAAFProperty> {
 public:
-    Property(Object& object, PropertyDefinition& definition, PropertyValue& value)
-        : object_(&object), definition_(&definition), value_(&value) {}
+    explicit Property(Object& object) : object_(&object) {}
+    void Set(PropertyDefinition& definition, PropertyValue& value) {
+        definition_ = &definition;
+        value_ = &value;
+    }
 
     HRESULT GetDefinition(IAAFPropertyDef** propDef) override {
         return propDef == nullptr ? AAFRESULT_NULL_PARAM : GiveOut(definition_.get(), propDef);

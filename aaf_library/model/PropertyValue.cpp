@@ -22,7 +22,8 @@ bool IsWithin(const Object* candidate, const Object* holder) {
 
 }  // namespace
 
-PropertyValue::PropertyValue(TypeDefinition& type) : type_(&type) {}
+PropertyValue::PropertyValue(TypeDefinition& type, Bytes bytes)
+    : type_(&type), bytes_(std::move(bytes)) {}
 
 // The holder takes its values out before it lets them go, so none is left here.
 PropertyValue::~PropertyValue() = default;

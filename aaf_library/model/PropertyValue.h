@@ -37,9 +37,9 @@ struct AsStored {
 // The value that stands in an object is the very one that was set on it, so a
 // caller who holds it sees and makes changes of the object. The objects that it
 // contains then belong to that object.
-class PropertyValue : public Implements<Unknown, IAAFPropertyValue> {
+class PropertyValue final : public Implements<Unknown, IAAFPropertyValue> {
 public:
-    explicit PropertyValue(TypeDefinition& type);
+    PropertyValue(TypeDefinition& type, Bytes bytes);
 
     TypeDefinition& type() const { return *type_; }
     bool HoldsObjects() const;
@@ -83,10 +83,8 @@ public:
     // No for a value that is kept as stored; its type then is one of bytes.
     HRESULT IsDefinedType(aafBoolean_t* isDefined) override;
 
-protected:
-    ~PropertyValue() override;
-
 private:
+    ~PropertyValue() override;
     static void Attach(Object& object, Object& owner);
     static void Detach(Object& object);
     void TellHolder();

@@ -19,6 +19,14 @@ bool IsAscii(const Text& text) {
     return std::all_of(text.begin(), text.end(), [](auto c) { return (c & ~0x7F) == 0; });
 }
 
+bool IsAsciiUtf16(const std::uint8_t* bytes, std::size_t size) {
+    unsigned beyond = 0;
+    for (std::size_t i = 0; i + 1 < size; i += 2) {
+        beyond |= (bytes[i] & 0x80u) | bytes[i + 1];
+    }
+    return beyond == 0;
+}
+
 template <class Units>
 void AppendUnits(const Units& units, Bytes& out) {
     const std::size_t before = out.size();
@@ -53,6 +61,33 @@ std::wstring FromUtf16(const std::uint8_t* bytes, std::size_t size) {
     return encodings::ToWideLossy(encodings::FromUtf16(std::u16string(text.begin(), text.end())));
 }
 
+std::size_t CountOfUtf16(const std::uint8_t* bytes, std::size_t size) {
+    return IsAsciiUtf16(bytes, size) ? size / 2 : FromUtf16(bytes, size).size();
+}
+
+HRESULT CopyUtf16(const std::uint8_t* bytes, std::size_t size, void* buffer,
+                  std::size_t bufferBytes) {
+    if (!IsAsciiUtf16(bytes, size)) {
+        const std::wstring text = FromUtf16(bytes, size);
+        const std::size_t needed = text.size() * sizeof(aafCharacter);
+        if (bufferBytes < needed) {
+            return AAFRESULT_SMALLBUF;
+        }
+        std::memcpy(buffer, text.data(), needed);
+        return AAFRESULT_SUCCESS;
+    }
+    if (bufferBytes / sizeof(aafCharacter) < size / 2) {
+        return AAFRESULT_SMALLBUF;
+    }
+    // The caller's memory need not be aligned for characters.
+    auto* to = static_cast<std::uint8_t*>(buffer);
+    for (std::size_t i = 0; i < size / 2; ++i) {
+        const aafCharacter character = bytes[2 * i];
+        std::memcpy(to + i * sizeof character, &character, sizeof character);
+    }
+    return AAFRESULT_SUCCESS;
+}
+
 Bytes StoredText(const std::wstring& text) {
     Bytes bytes;
     AppendUtf16(text.c_str(), text.size() + 1, bytes);
@@ -78,23 +113,45 @@ std::wstring Widen(const char* ascii) {
     return {ascii, ascii + std::strlen(ascii)};
 }
 
-HRESULT CopyText(const std::wstring& text, aafCharacter* buffer, aafUInt32 bufferBytes) {
+namespace {
+
+template <class Character>
+HRESULT CopyCharacters(const Character* text, std::size_t size, aafCharacter* buffer,
+                       aafUInt32 bufferBytes) {
     if (buffer == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    if (bufferBytes / sizeof(aafCharacter) < text.size() + 1) {
+    if (bufferBytes / sizeof(aafCharacter) < size + 1) {
         return AAFRESULT_SMALLBUF;
     }
-    std::copy_n(text.c_str(), text.size() + 1, buffer);
+    std::copy_n(text, size + 1, buffer);
     return AAFRESULT_SUCCESS;
 }
 
-HRESULT TextSize(const std::wstring& text, aafUInt32* bytes) {
+HRESULT SizeOf(std::size_t characters, aafUInt32* bytes) {
     if (bytes == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    *bytes = static_cast<aafUInt32>((text.size() + 1) * sizeof(aafCharacter));
+    *bytes = static_cast<aafUInt32>((characters + 1) * sizeof(aafCharacter));
     return AAFRESULT_SUCCESS;
+}
+
+}  // namespace
+
+HRESULT CopyText(const std::wstring& text, aafCharacter* buffer, aafUInt32 bufferBytes) {
+    return CopyCharacters(text.c_str(), text.size(), buffer, bufferBytes);
+}
+
+HRESULT TextSize(const std::wstring& text, aafUInt32* bytes) {
+    return SizeOf(text.size(), bytes);
+}
+
+HRESULT CopyAscii(const char* text, aafCharacter* buffer, aafUInt32 bufferBytes) {
+    return CopyCharacters(text, std::strlen(text), buffer, bufferBytes);
+}
+
+HRESULT AsciiSize(const char* text, aafUInt32* bytes) {
+    return SizeOf(std::strlen(text), bytes);
 }
 
 }  // namespace aaf

@@ -14,6 +14,11 @@ namespace aaf {
 
 void AppendUtf16(const aafCharacter* text, std::size_t count, Bytes& out);
 std::wstring FromUtf16(const std::uint8_t* bytes, std::size_t size);
+// The same without a text between: how many characters there are, and the characters for a
+// buffer. More than it has room for: AAFRESULT_SMALLBUF.
+std::size_t CountOfUtf16(const std::uint8_t* bytes, std::size_t size);
+HRESULT CopyUtf16(const std::uint8_t* bytes, std::size_t size, void* buffer,
+                  std::size_t bufferBytes);
 
 // Stored form of a text with its terminating zero.
 Bytes StoredText(const std::wstring& text);
@@ -30,5 +35,8 @@ std::wstring Widen(const char* ascii);
 // Answers of the operations that hand out a text: bytes include the zero.
 HRESULT CopyText(const std::wstring& text, aafCharacter* buffer, aafUInt32 bufferBytes);
 HRESULT TextSize(const std::wstring& text, aafUInt32* bytes);
+// The same for texts of the constant tables.
+HRESULT CopyAscii(const char* text, aafCharacter* buffer, aafUInt32 bufferBytes);
+HRESULT AsciiSize(const char* text, aafUInt32* bytes);
 
 }  // namespace aaf

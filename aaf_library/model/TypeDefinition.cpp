@@ -45,9 +45,8 @@ HRESULT TypeDefinition::Decode(const std::uint8_t* stored, std::size_t size, voi
     return AAFRESULT_SUCCESS;
 }
 
-void TypeDefinition::FillEmpty(PropertyValue& value) const {
-    const ValueForm valueForm = form();
-    value.BytesToChange().assign(valueForm == ValueForm::Data ? StoredSize() : 0, 0);
+Bytes TypeDefinition::EmptyBytes() const {
+    return Bytes(form() == ValueForm::Data ? StoredSize() : 0);
 }
 
 RefPtr<PropertyValue> TypeDefinition::NewValue() {
@@ -87,9 +86,7 @@ HRESULT TypeDefinition::Take(IAAFPropertyValue* argument, PropertyValue** value)
 
 HRESULT TypeDefinition::GiveValue(TypeDefinition& type, Bytes stored,
                                   IAAFPropertyValue** out) const {
-    RefPtr<PropertyValue> value = type.NewValue();
-    value->BytesToChange() = std::move(stored);
-    return GiveOut(value.get(), out);
+    return GiveOut(type.model()->NewValue(type, std::move(stored)).get(), out);
 }
 
 TypeDefinition* TypeOf(IAAFTypeDef* argument, const Model* model) {

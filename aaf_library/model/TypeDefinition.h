@@ -82,6 +82,8 @@ public:
     // Sizes of one value; 0 when they vary.
     virtual std::size_t StoredSize() const { return 0; }
     virtual std::size_t NativeSize() const { return 0; }
+    // Whether both layouts are the same bytes, whatever a caller registers.
+    virtual bool IsStoredAsNative() const { return false; }
     // One value of a fixed size.
     virtual void AppendStored(const std::uint8_t* native, Bytes& out) const;
     virtual void CopyNative(const std::uint8_t* stored, std::uint8_t* native) const;
@@ -92,8 +94,8 @@ public:
     virtual HRESULT Decode(const std::uint8_t* stored, std::size_t size, void* native,
                            std::size_t bytes) const;
 
-    // Gives the value its starting content: zeros of the stored size, or nothing.
-    void FillEmpty(PropertyValue& value) const;
+    // What a value starts with: zeros of the stored size, or nothing.
+    Bytes EmptyBytes() const;
     // A free value of this type.
     RefPtr<PropertyValue> NewValue();
 

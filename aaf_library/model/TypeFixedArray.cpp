@@ -22,12 +22,20 @@ std::size_t TypeFixedArray::NativeSize() const {
 }
 
 void TypeFixedArray::AppendStored(const std::uint8_t* native, Bytes& out) const {
+    if (element()->IsStoredAsNative()) {
+        out.insert(out.end(), native, native + StoredSize());
+        return;
+    }
     for (std::size_t i = 0; i < count_; ++i) {
         element()->AppendStored(native + i * element()->NativeSize(), out);
     }
 }
 
 void TypeFixedArray::CopyNative(const std::uint8_t* stored, std::uint8_t* native) const {
+    if (element()->IsStoredAsNative()) {
+        std::memcpy(native, stored, StoredSize());
+        return;
+    }
     for (std::size_t i = 0; i < count_; ++i) {
         element()->CopyNative(stored + i * ElementSize(), native + i * element()->NativeSize());
     }

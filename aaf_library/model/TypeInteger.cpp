@@ -75,7 +75,11 @@ void TypeInteger::AppendStored(const std::uint8_t* native, Bytes& out) const {
 }
 
 void TypeInteger::CopyNative(const std::uint8_t* stored, std::uint8_t* native) const {
-    PutNativeNumber(UnsignedAt(stored, size_), native, size_);
+    if (IsStoredAsNative()) {
+        std::memcpy(native, stored, size_);
+    } else {
+        PutNativeNumber(UnsignedAt(stored, size_), native, size_);
+    }
 }
 
 HRESULT TypeInteger::Initialize(aafUID_constref id, aafUInt8 intSize, aafBoolean_t isSigned,

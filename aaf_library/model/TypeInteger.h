@@ -17,6 +17,7 @@ public:
 
     std::size_t StoredSize() const override { return size_; }
     std::size_t NativeSize() const override { return size_; }
+    bool IsStoredAsNative() const override { return size_ == 1 || kIsStoredOrder; }
     void AppendStored(const std::uint8_t* native, Bytes& out) const override;
     void CopyNative(const std::uint8_t* stored, std::uint8_t* native) const override;
 
@@ -32,6 +33,9 @@ public:
 private:
     // The caller's integer in this type's size, its sign extended.
     HRESULT Widen(const std::uint8_t* native, aafUInt32 bytes, Bytes& out) const;
+
+    // Stored numbers begin with their lowest byte.
+    static constexpr bool kIsStoredOrder = __BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__;
 
     unsigned size_ = 0;
     bool signed_ = false;

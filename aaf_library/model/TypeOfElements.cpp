@@ -103,15 +103,14 @@ HRESULT TypeOfElements::GiveElement(const PropertyValue& value, std::size_t inde
     if (index >= CountOf(value)) {
         return AAFRESULT_BADINDEX;
     }
-    RefPtr<PropertyValue> element = element_->NewValue();
     if (HasObjects()) {
+        RefPtr<PropertyValue> element = element_->NewValue();
         element->InsertObject(0, value.objects()[index].get());
-    } else {
-        const auto first =
-            value.bytes().begin() + static_cast<std::ptrdiff_t>(index * ElementSize());
-        element->BytesToChange().assign(first, first + static_cast<std::ptrdiff_t>(ElementSize()));
+        return GiveOut(element.get(), out);
     }
-    return GiveOut(element.get(), out);
+    const auto size = static_cast<std::ptrdiff_t>(ElementSize());
+    const auto first = value.bytes().begin() + static_cast<std::ptrdiff_t>(index) * size;
+    return GiveValue(*element_, Bytes(first, first + size), out);
 }
 
 HRESULT TypeOfElements::GiveElements(PropertyValue& value, IEnumAAFPropertyValues** enumerator) {

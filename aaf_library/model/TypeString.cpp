@@ -30,19 +30,12 @@ HRESULT TypeString::Encode(const void* native, std::size_t bytes, Bytes& out) co
 }
 
 std::size_t TypeString::DecodedSize(const std::uint8_t* stored, std::size_t size) const {
-    return FromUtf16(stored, size).size() * sizeof(aafCharacter);
+    return CountOfUtf16(stored, size) * sizeof(aafCharacter);
 }
 
 HRESULT TypeString::Decode(const std::uint8_t* stored, std::size_t size, void* native,
                            std::size_t bytes) const {
-    const std::wstring text = FromUtf16(stored, size);
-    if (bytes < text.size() * sizeof(aafCharacter)) {
-        return AAFRESULT_SMALLBUF;
-    }
-    if (!text.empty()) {
-        std::memcpy(native, text.data(), text.size() * sizeof(aafCharacter));
-    }
-    return AAFRESULT_SUCCESS;
+    return CopyUtf16(stored, size, native, bytes);
 }
 
 HRESULT TypeString::Initialize(aafUID_constref id, IAAFTypeDef* typeDef,
@@ -72,7 +65,7 @@ HRESULT TypeString::GetCount(IAAFPropertyValue* propVal, aafUInt32* count) {
     if (const HRESULT result = Take(propVal, &value); result < 0) {
         return result;
     }
-    *count = static_cast<aafUInt32>(FromUtf16(value->bytes().data(), value->bytes().size()).size());
+    *count = static_cast<aafUInt32>(CountOfUtf16(value->bytes().data(), value->bytes().size()));
     return AAFRESULT_SUCCESS;
 }
 

@@ -8,8 +8,9 @@ namespace aaf {
 
 namespace {
 
-// By this id an object tells another object of this library where it is.
-constexpr GUID kImplementationId = ncfGuid("7C1D52F0-93B6-4E0A-8F3C-2A5E8B64D917");
+// By this id an object tells another object of this library where it is; unlike an interface, it
+// is given without a reference.
+constexpr GUID kImplementationId = ncfGuid("87589AAF-6606-496E-ABE1-ED45AB0FC7D9");
 
 }  // namespace
 
@@ -49,15 +50,16 @@ HRESULT Unknown::QueryInterface(REFIID iid, void** out) {
 }
 
 void* Unknown::FindInterface(const GUID& iid) {
-    if (iid == IID_IUnknown_Zero || iid == IID_IUnknown_COM) {
-        return Identity();
-    }
-    return iid == kImplementationId ? this : nullptr;
+    return iid == IID_IUnknown_Zero || iid == IID_IUnknown_COM ? Identity() : nullptr;
 }
 
 HRESULT Unknown::Query(const GUID& iid, void** out) {
     if (out == nullptr) {
         return AAF_E_INVALIDARG;
+    }
+    if (iid == kImplementationId) {
+        *out = this;
+        return AAFRESULT_SUCCESS;
     }
     *out = FindInterface(iid);
     if (*out == nullptr) {
@@ -87,12 +89,9 @@ ULONG Unknown::ReleaseReference() {
 
 Unknown* ImplementationOf(IUnknown* any) {
     void* found = nullptr;
-    if (any == nullptr || any->QueryInterface(kImplementationId, &found) < 0 || found == nullptr) {
-        return nullptr;
-    }
-    auto* object = static_cast<Unknown*>(found);
-    object->Release();
-    return object;
+    return any != nullptr && any->QueryInterface(kImplementationId, &found) >= 0
+               ? static_cast<Unknown*>(found)
+               : nullptr;
 }
 
 }  // namespace aaf

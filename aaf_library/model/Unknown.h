@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <type_traits>
+#include <typeinfo>
+
 #include "aaf_library/model/GeneralCodes.h"
 #include "aaf_library/model/NotImplemented.h"
 #include "aaf_library/model/RefPtr.h"
@@ -40,6 +43,8 @@ public:
     void Keep();
     void Free();
     bool IsKept() const { return kept_; }
+    // Whether all references but one are given back.
+    bool IsHeldOnce() const { return references_ == 1; }
 
 protected:
     Unknown() = default;
@@ -91,14 +96,27 @@ Unknown* ImplementationOf(IUnknown* any);
 
 template <class T, class Interface>
 T* ImplementationAs(Interface* any) {
-    return dynamic_cast<T*>(ImplementationOf(any));
+    Unknown* const object = ImplementationOf(any);
+    if constexpr (std::is_final_v<T>) {
+        return object != nullptr && typeid(*object) == typeid(T) ? static_cast<T*>(object)
+                                                                 : nullptr;
+    } else {
+        return dynamic_cast<T*>(object);
+    }
 }
 
-// Gives an object out as interface I, with a reference for the caller.
-template <class I>
-HRESULT GiveOut(Unknown* object, I** out) {
-    return object->QueryInterface(aafIdOf(static_cast<const I*>(nullptr)),
-                                  reinterpret_cast<void**>(out));
+// Gives an object out as interface I, with a reference for the caller. It is asked for the
+// interface only where its class leaves open whether it has it.
+template <class I, class T>
+HRESULT GiveOut(T* object, I** out) {
+    if constexpr (std::is_convertible_v<T*, I*>) {
+        object->AddRef();
+        *out = object;
+        return AAFRESULT_SUCCESS;
+    } else {
+        return object->QueryInterface(aafIdOf(static_cast<const I*>(nullptr)),
+                                      reinterpret_cast<void**>(out));
+    }
 }
 
 // Booleans and other enumerated arguments are checked before anything else.

@@ -116,7 +116,7 @@ private:
 
     void KeepAsStored(Object& object, const PropertyDefinition& definition,
                       const StoredProperty& from, const std::string& problem) {
-        if (object.MadeValues().count(definition.pid()) != 0) {
+        if (object.MadeValues().Find(definition.pid()) != nullptr) {
             Note(Place() + problem + "; it is left out");
             return;
         }

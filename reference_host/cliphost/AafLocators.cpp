@@ -10,12 +10,12 @@
 namespace cliphost {
 namespace {
 
-constexpr int kDeepest = 32;  // descriptors inside descriptors
+constexpr int kDeepestDescriptors = 32;  // descriptors inside descriptors
 
 void VisitDescriptor(IAAFMob& mob, IUnknown* object, const TakeLocator& take, int depth) {
     const auto descriptor = As<IAAFEssenceDescriptor>(object);
     aafUInt32 count = 0;
-    if (!descriptor || depth > kDeepest || descriptor->CountLocators(&count) < 0) {
+    if (!descriptor || depth > kDeepestDescriptors || descriptor->CountLocators(&count) < 0) {
         return;
     }
     for (aafUInt32 i = 0; i < count; ++i) {

@@ -4,8 +4,11 @@
 #include "reference_host/cliphost/AafTree.h"
 
 #include <algorithm>
+#include <functional>
 #include <map>
+#include <string_view>
 #include <unordered_map>
+#include <utility>
 
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "host_interfaces/aaf/AAFMobs.h"
@@ -16,7 +19,7 @@ namespace cliphost {
 namespace {
 
 constexpr int kDeepest = 32;  // objects inside objects
-constexpr std::size_t kUsualFacts = 12;
+constexpr std::string_view kClassOfObject = "ObjClass";
 
 // The names of definitions, each asked for once.
 template <class Definition>
@@ -36,64 +39,82 @@ private:
         host::Ref<Definition> definition;  // so that no other comes to its place
         std::string name;
     };
-    std::unordered_map<Definition*, Named> names_;
+    // A movie's description has some sixty definitions.
+    std::unordered_map<Definition*, Named> names_{64};
 };
-
-// The order of properties is the library's affair; ours is by name.
-template <class Item>
-void InsertByName(Item item, std::vector<Item>& items) {
-    const auto place =
-        std::upper_bound(items.begin(), items.end(), item,
-                         [](const Item& a, const Item& b) { return a.name < b.name; });
-    items.insert(place, std::move(item));
-}
 
 class TreeReader {
 public:
-    TreeNode Read(IAAFObject* object, int depth);
+    void Read(IAAFObject* object, int depth, TreeNode& node);
 
 private:
-    void ReadProperty(IAAFProperty& property, int depth, TreeNode& node);
+    struct Property {
+        const std::string* name;
+        host::Ref<IAAFPropertyValue> value;
+    };
+    // The order of properties is the library's affair; ours is by name. They come behind the open
+    // ones.
+    void OpenProperties(IAAFObject* object);
+    void ReadProperty(const Property& property, int depth, TreeNode& node);
 
     ValueReader values_;
     Names<IAAFClassDef> classes_;
     Names<IAAFPropertyDef> properties_;
+    // Of the object that is being read, behind those of the objects that it is part of.
+    std::vector<Property> open_;
 };
 
-TreeNode TreeReader::Read(IAAFObject* object, int depth) {
-    TreeNode node;
+void TreeReader::OpenProperties(IAAFObject* object) {
+    host::Ref<IEnumAAFProperties> properties;
+    if (object->GetProperties(properties.Out()) < 0) {
+        return;
+    }
+    const auto first = static_cast<std::ptrdiff_t>(open_.size());
+    host::Ref<IAAFProperty> property;
+    host::Ref<IAAFPropertyDef> definition;
+    host::Ref<IAAFPropertyValue> value;
+    while (properties->NextOne(property.Out()) >= 0) {
+        if (property->GetDefinition(definition.Out()) < 0 || property->GetValue(value.Out()) < 0) {
+            continue;
+        }
+        const std::string& name = properties_.Of(definition);
+        const auto place =
+            std::upper_bound(open_.begin() + first, open_.end(), name,
+                             [](const std::string& a, const Property& b) { return a < *b.name; });
+        open_.insert(place, {&name, std::move(value)});
+    }
+}
+
+void TreeReader::Read(IAAFObject* object, int depth, TreeNode& node) {
     host::Ref<IAAFClassDef> definition;
     if (object->GetDefinition(definition.Out()) >= 0) {
         node.title = classes_.Of(definition);
     }
-    host::Ref<IEnumAAFProperties> properties;
-    if (depth > kDeepest || object->GetProperties(properties.Out()) < 0) {
-        return node;
-    }
-    node.facts.reserve(kUsualFacts);
-    host::Ref<IAAFProperty> property;
-    while (properties->NextOne(property.Out()) >= 0) {
-        ReadProperty(*property, depth, node);
-    }
-    return node;
-}
-
-void TreeReader::ReadProperty(IAAFProperty& property, int depth, TreeNode& node) {
-    host::Ref<IAAFPropertyDef> definition;
-    host::Ref<IAAFPropertyValue> value;
-    if (property.GetDefinition(definition.Out()) < 0 || property.GetValue(value.Out()) < 0) {
+    if (depth > kDeepest) {
         return;
     }
-    const std::string& name = properties_.Of(definition);
-    if (depth > 0 && name == "ObjClass") {
-        return;  // the title says it
+    const std::size_t first = open_.size();
+    OpenProperties(object);
+    const std::size_t end = open_.size();
+    node.facts.reserve(end - first);
+    for (std::size_t i = first; i < end; ++i) {
+        ReadProperty(std::exchange(open_[i], {}), depth, node);
     }
+    open_.resize(first);
+}
+
+void TreeReader::ReadProperty(const Property& property, int depth, TreeNode& node) {
+    const bool isClass = *property.name == kClassOfObject;  // the title says it
+    if (isClass && depth > 0) {
+        return;
+    }
+    ValueType& type = values_.TypeOf(property.value.get());
     std::vector<TreeNode> parts;
-    if (values_.TakeObjects(
-            value.get(), [&](IAAFObject* object) { parts.push_back(Read(object, depth + 1)); })) {
-        InsertByName(TreeNode::Branch{name, std::move(parts)}, node.branches);
-    } else if (name != "ObjClass") {
-        InsertByName(TreeNode::Fact{name, values_.Text(value.get())}, node.facts);
+    const auto read = [&](IAAFObject* part) { Read(part, depth + 1, parts.emplace_back()); };
+    if (type.TakeObjects(property.value.get(), std::ref(read))) {
+        node.branches.push_back({*property.name, std::move(parts)});
+    } else if (!isClass) {
+        node.facts.push_back({*property.name, type.Text(property.value.get())});
     }
 }
 
@@ -127,7 +148,7 @@ TreeNode ReadTree(IAAFFile* file) {
     TreeReader reader;
     for (const auto& each : mobs) {
         if (const auto object = As<IAAFObject>(each.get())) {
-            branch.nodes.push_back(reader.Read(object.get(), 0));
+            reader.Read(object.get(), 0, branch.nodes.emplace_back());
         }
     }
     root.branches.push_back(std::move(branch));

@@ -6,6 +6,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cstdlib>
 #include <vector>
 
 #include "host_interfaces/aaf/AAFDefinitions.h"
@@ -17,40 +18,17 @@
 
 namespace cliphost {
 
-// What values of one type have in common. The type lives as long.
-class ValueType {
-public:
-    ValueType(ValueReader& reader, host::Ref<IAAFTypeDef> type)
-        : reader_(reader), type_(std::move(type)) {}
-    virtual ~ValueType() = default;
-    ValueType(const ValueType&) = delete;
-    ValueType& operator=(const ValueType&) = delete;
-
-    virtual std::string Text(IAAFPropertyValue* value) = 0;
-    virtual bool TakeObjects(IAAFPropertyValue*, const std::function<void(IAAFObject*)>&) {
-        return false;
-    }
-
-protected:
-    IAAFTypeDef* type() const { return type_.get(); }
-    ValueReader& reader() const { return reader_; }
-
-private:
-    ValueReader& reader_;
-    host::Ref<IAAFTypeDef> type_;
-};
-
 namespace {
 
 constexpr char kUnreadable[] = "?";
 constexpr aafUInt32 kMostElements = 64;  // of an array shown on one line
 
-// A type behind one of its own interfaces.
+// A type behind one of its own interfaces. The type lives as long.
 template <class Interface>
 class TypeAs : public ValueType {
 public:
     TypeAs(ValueReader& reader, host::Ref<IAAFTypeDef> type)
-        : ValueType(reader, std::move(type)), as_(As<Interface>(this->type())) {}
+        : reader_(reader), type_(std::move(type)), as_(As<Interface>(type_.get())) {}
 
     std::string Text(IAAFPropertyValue* value) final {
         return as_ ? TextOfValue(value) : kUnreadable;
@@ -59,8 +37,13 @@ public:
 protected:
     virtual std::string TextOfValue(IAAFPropertyValue* value) = 0;
     Interface* as() const { return as_.get(); }
+    IAAFTypeDef* type() const { return type_.get(); }
+    std::string TextOfOther(IAAFPropertyValue* value) { return reader_.TypeOf(value).Text(value); }
+    ValueReader& reader() const { return reader_; }
 
 private:
+    ValueReader& reader_;
+    host::Ref<IAAFTypeDef> type_;
     host::Ref<Interface> as_;
 };
 
@@ -78,8 +61,11 @@ std::string NamedId(const std::string& name, const aafUID_t& id) {
 
 class UnknownType final : public ValueType {
 public:
-    using ValueType::ValueType;
+    UnknownType(ValueReader&, host::Ref<IAAFTypeDef> type) : type_(std::move(type)) {}
     std::string Text(IAAFPropertyValue*) override { return kUnreadable; }
+
+private:
+    host::Ref<IAAFTypeDef> type_;
 };
 
 class IntegerType final : public TypeAs<IAAFTypeDefInt> {
@@ -164,7 +150,7 @@ public:
             host::Ref<IAAFPropertyValue> member;
             const bool isRead = as()->GetValue(value, i, member.Out()) >= 0;
             text += (i == 0 ? "" : ", ") + members_[i] + ' ' +
-                    (isRead ? reader().Text(member.get()) : kUnreadable);
+                    (isRead ? TextOfOther(member.get()) : kUnreadable);
         }
         return text;
     }
@@ -189,7 +175,10 @@ public:
                               static_cast<aafUInt32>(count * sizeof(wchar_t))) < 0) {
             return kUnreadable;
         }
-        return '"' + Utf8(wide.data()) + '"';
+        std::string text = "\"";
+        text += Utf8(wide.data());
+        text += '"';
+        return text;
     }
 };
 
@@ -284,7 +273,7 @@ protected:
         for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
             host::Ref<IAAFPropertyValue> element;
             elements.push_back(this->as()->GetElementValue(value, i, element.Out()) >= 0
-                                   ? this->reader().Text(element.get())
+                                   ? this->TextOfOther(element.get())
                                    : kUnreadable);
         }
         return ElementsText(count, elements);
@@ -321,7 +310,7 @@ public:
         for (aafUInt32 i = 0; i < count; ++i) {
             host::Ref<IAAFPropertyValue> element;
             if (as()->GetElementValue(value, i, element.Out()) >= 0) {
-                reader().TakeObjects(element.get(), take);
+                reader().TypeOf(element.get()).TakeObjects(element.get(), take);
             }
         }
         return ownsObjects_;
@@ -347,7 +336,7 @@ public:
         std::vector<std::string> elements;
         host::Ref<IAAFPropertyValue> element;
         while (elements.size() < kMostElements && enumerator->NextOne(element.Out()) >= 0) {
-            elements.push_back(reader().Text(element.get()));
+            elements.push_back(TextOfOther(element.get()));
         }
         return ElementsText(count, elements);
     }
@@ -359,7 +348,7 @@ public:
         }
         host::Ref<IAAFPropertyValue> element;
         while (elements->NextOne(element.Out()) >= 0) {
-            reader().TakeObjects(element.get(), take);
+            reader().TypeOf(element.get()).TakeObjects(element.get(), take);
         }
         return true;
     }
@@ -392,7 +381,7 @@ public:
     using TypeAs::TypeAs;
     std::string TextOfValue(IAAFPropertyValue* value) override {
         host::Ref<IAAFPropertyValue> actual;
-        return as()->GetActualValue(value, actual.Out()) >= 0 ? reader().Text(actual.get())
+        return as()->GetActualValue(value, actual.Out()) >= 0 ? TextOfOther(actual.get())
                                                               : kUnreadable;
     }
 };
@@ -402,7 +391,7 @@ public:
     using TypeAs::TypeAs;
     std::string TextOfValue(IAAFPropertyValue* value) override {
         host::Ref<IAAFPropertyValue> base;
-        return as()->GetBaseValue(value, base.Out()) >= 0 ? reader().Text(base.get()) : kUnreadable;
+        return as()->GetBaseValue(value, base.Out()) >= 0 ? TextOfOther(base.get()) : kUnreadable;
     }
 };
 
@@ -443,13 +432,16 @@ std::unique_ptr<ValueType> MakeType(ValueReader& reader, const host::Ref<IAAFTyp
 }  // namespace
 
 std::string Utf8(std::wstring_view wide) {
-    if (std::all_of(wide.begin(), wide.end(), [](wchar_t c) { return (c & ~0x7F) == 0; })) {
-        std::string text(wide.size(), '\0');
-        std::transform(wide.begin(), wide.end(), text.begin(),
-                       [](wchar_t c) { return static_cast<char>(c); });
-        return text;
+    std::string text(wide.size(), '\0');
+    bool isAscii = true;
+    for (std::size_t i = 0; i < wide.size(); ++i) {
+        text[i] = static_cast<char>(wide[i]);
+        isAscii = isAscii && (wide[i] & ~0x7F) == 0;
     }
-    return encodings::ToUtf8Lossy(encodings::FromWide(wide));
+    if (!isAscii) {
+        return encodings::ToUtf8Lossy(encodings::FromWide(wide));
+    }
+    return text;
 }
 
 namespace {
@@ -458,58 +450,75 @@ constexpr char kUpper[] = "0123456789ABCDEF";
 constexpr char kLower[] = "0123456789abcdef";
 
 // Two digits for each of the bytes, which are what the numbers end in.
-void AppendHex(const char* digits, std::initializer_list<unsigned> bytes, std::string& text) {
+char* PutHex(const char* digits, std::initializer_list<unsigned> bytes, char* to) {
     for (const unsigned byte : bytes) {
-        text += digits[byte >> 4 & 15];
-        text += digits[byte & 15];
+        *to++ = digits[byte >> 4 & 15];
+        *to++ = digits[byte & 15];
     }
+    return to;
+}
+
+// So many characters at least, of which a sign is the first.
+void AppendDecimal(int number, std::size_t characters, std::string& text) {
+    const std::string digits = std::to_string(std::abs(number));
+    const std::size_t used = digits.size() + (number < 0);
+    text.append(number < 0, '-');
+    text.append(characters - std::min(characters, used), '0');
+    text += digits;
 }
 
 }  // namespace
 
 std::string ToText(const aafUID_t& id) {
     const unsigned char* const node = id.Data4;
-    std::string text = "{";
-    AppendHex(kUpper, {id.Data1 >> 24, id.Data1 >> 16, id.Data1 >> 8, id.Data1}, text);
-    text += '-';
-    AppendHex(kUpper, {unsigned{id.Data2} >> 8, id.Data2}, text);
-    text += '-';
-    AppendHex(kUpper, {unsigned{id.Data3} >> 8, id.Data3}, text);
-    text += '-';
-    AppendHex(kUpper, {node[0], node[1]}, text);
-    text += '-';
-    AppendHex(kUpper, {node[2], node[3], node[4], node[5], node[6], node[7]}, text);
-    return text + '}';
+    std::string text = "{00000000-0000-0000-0000-000000000000}";
+    PutHex(kUpper, {id.Data1 >> 24, id.Data1 >> 16, id.Data1 >> 8, id.Data1}, &text[1]);
+    PutHex(kUpper, {unsigned{id.Data2} >> 8, id.Data2}, &text[10]);
+    PutHex(kUpper, {unsigned{id.Data3} >> 8, id.Data3}, &text[15]);
+    PutHex(kUpper, {node[0], node[1]}, &text[20]);
+    PutHex(kUpper, {node[2], node[3], node[4], node[5], node[6], node[7]}, &text[25]);
+    return text;
 }
 
 // SMPTE ST 330: 32 bytes in groups of four.
 std::string ToText(const aafMobID_t& id) {
-    std::vector<unsigned char> bytes(id.SMPTELabel, id.SMPTELabel + 12);
-    bytes.insert(bytes.end(), {id.length, id.instanceHigh, id.instanceMid, id.instanceLow});
+    const unsigned char* const label = id.SMPTELabel;
     const aafUID_t& m = id.material;
-    for (const int shift : {24, 16, 8, 0}) {
-        bytes.push_back(static_cast<unsigned char>(m.Data1 >> shift));
-    }
-    for (const unsigned part : {unsigned{m.Data2}, unsigned{m.Data3}}) {
-        bytes.push_back(static_cast<unsigned char>(part >> 8));
-        bytes.push_back(static_cast<unsigned char>(part));
-    }
-    bytes.insert(bytes.end(), m.Data4, m.Data4 + 8);
-    std::string text = "urn:smpte:umid:";
-    for (std::size_t i = 0; i < bytes.size(); ++i) {
-        if (i > 0 && i % 4 == 0) {
-            text += '.';
-        }
-        AppendHex(kLower, {bytes[i]}, text);
+    const unsigned char* const node = m.Data4;
+    const unsigned groups[8][4] = {
+        {label[0], label[1], label[2], label[3]},
+        {label[4], label[5], label[6], label[7]},
+        {label[8], label[9], label[10], label[11]},
+        {id.length, id.instanceHigh, id.instanceMid, id.instanceLow},
+        {m.Data1 >> 24, m.Data1 >> 16, m.Data1 >> 8, m.Data1},
+        {unsigned{m.Data2} >> 8, m.Data2, unsigned{m.Data3} >> 8, m.Data3},
+        {node[0], node[1], node[2], node[3]},
+        {node[4], node[5], node[6], node[7]},
+    };
+    constexpr std::string_view kStart = "urn:smpte:umid:";
+    std::string text(kStart.size() + 8 * 9 - 1, '.');
+    char* to = &text[kStart.copy(&text[0], kStart.size())];
+    for (const auto& group : groups) {
+        to = PutHex(kLower, {group[0], group[1], group[2], group[3]}, to) + 1;
     }
     return text;
 }
 
 std::string ToText(const aafTimeStamp_t& time) {
-    return fmt::format("{:04}-{:02}-{:02}T{:02}:{:02}:{:02}.{:02}Z", time.date.year,
-                       unsigned{time.date.month}, unsigned{time.date.day}, unsigned{time.time.hour},
-                       unsigned{time.time.minute}, unsigned{time.time.second},
-                       unsigned{time.time.fraction});
+    struct Part {
+        int number;
+        std::size_t characters;
+        char after;
+    };
+    std::string text;
+    for (const Part& part :
+         {Part{time.date.year, 4, '-'}, Part{time.date.month, 2, '-'}, Part{time.date.day, 2, 'T'},
+          Part{time.time.hour, 2, ':'}, Part{time.time.minute, 2, ':'},
+          Part{time.time.second, 2, '.'}, Part{time.time.fraction, 2, 'Z'}}) {
+        AppendDecimal(part.number, part.characters, text);
+        text += part.after;
+    }
+    return text;
 }
 
 std::string ToText(const aafRational_t& rational) {
@@ -517,66 +526,60 @@ std::string ToText(const aafRational_t& rational) {
 }
 
 std::string ToText(const aafVersionType_t& version) {
-    return fmt::format("{}.{}", static_cast<int>(version.major), static_cast<int>(version.minor));
-}
-
-ValueReader::ValueReader() = default;
-ValueReader::~ValueReader() = default;
-
-ValueType* ValueReader::TypeOf(IAAFPropertyValue* value) {
-    host::Ref<IAAFTypeDef> type;
-    if (!value || value->GetType(type.Out()) < 0 || !type) {
-        return nullptr;
-    }
-    std::unique_ptr<ValueType>& known = types_[type.get()];
-    if (!known) {
-        known = MakeType(*this, type);
-    }
-    return known.get();
+    return std::to_string(version.major) + '.' + std::to_string(version.minor);
 }
 
 namespace {
 
-// A library gives a property that is no value of its type as bytes of no defined type.
+// A library gives what is no value of its property as bytes of no defined type.
 bool IsRaw(IAAFPropertyValue* value) {
     aafBoolean_t isDefined = kAAFTrue;
     return value != nullptr && value->IsDefinedType(&isDefined) >= 0 && isDefined == kAAFFalse;
 }
 
-std::string RawText(IAAFPropertyValue* value) {
-    host::Ref<IAAFTypeDef> type;
-    value->GetType(type.Out());
-    const auto array = As<IAAFTypeDefVariableArray>(type.get());
-    aafUInt32 count = 0;
-    if (!array || array->GetCount(value, &count) < 0) {
-        return kUnreadable;
+class RawType final : public ValueType {
+public:
+    std::string Text(IAAFPropertyValue* value) override {
+        host::Ref<IAAFTypeDef> type;
+        value->GetType(type.Out());
+        const auto array = As<IAAFTypeDefVariableArray>(type.get());
+        aafUInt32 count = 0;
+        if (!array || array->GetCount(value, &count) < 0) {
+            return kUnreadable;
+        }
+        std::vector<aafUInt8> bytes(std::max<aafUInt32>(count, 1));
+        if (array->GetCArray(value, bytes.data(), count) < 0) {
+            return kUnreadable;
+        }
+        std::string text = "raw bytes";
+        for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
+            text += fmt::format(" {:02x}", bytes[i]);
+        }
+        return count <= kMostElements ? text : text + fmt::format(" ... {} in all", count);
     }
-    std::vector<aafUInt8> bytes(std::max<aafUInt32>(count, 1));
-    if (array->GetCArray(value, bytes.data(), count) < 0) {
-        return kUnreadable;
-    }
-    std::string text = "raw bytes";
-    for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
-        text += ' ';
-        AppendHex(kLower, {bytes[i]}, text);
-    }
-    return count <= kMostElements ? text : text + fmt::format(" ... {} in all", count);
-}
+};
 
 }  // namespace
 
-std::string ValueReader::Text(IAAFPropertyValue* value) {
-    if (IsRaw(value)) {
-        return RawText(value);
-    }
-    ValueType* const type = TypeOf(value);
-    return type == nullptr ? kUnreadable : type->Text(value);
-}
+ValueReader::ValueReader() = default;
+ValueReader::~ValueReader() = default;
 
-bool ValueReader::TakeObjects(IAAFPropertyValue* value,
-                              const std::function<void(IAAFObject*)>& take) {
-    ValueType* const type = TypeOf(value);
-    return type != nullptr && type->TakeObjects(value, take);
+ValueType& ValueReader::TypeOf(IAAFPropertyValue* value) {
+    if (IsRaw(value)) {
+        if (!raw_) {
+            raw_ = std::make_unique<RawType>();
+        }
+        return *raw_;
+    }
+    host::Ref<IAAFTypeDef> type;
+    if (!value || value->GetType(type.Out()) < 0) {
+        type.Reset();
+    }
+    std::unique_ptr<ValueType>& known = types_[type.get()];
+    if (!known) {
+        known = MakeType(*this, type);
+    }
+    return *known;
 }
 
 }  // namespace cliphost

@@ -19,7 +19,24 @@ std::string ToText(const aafTimeStamp_t& time);
 std::string ToText(const aafRational_t& rational);
 std::string ToText(const aafVersionType_t& version);
 
-class ValueType;
+// What values of one type have in common.
+class ValueType {
+public:
+    ValueType() = default;
+    virtual ~ValueType() = default;
+    ValueType(const ValueType&) = delete;
+    ValueType& operator=(const ValueType&) = delete;
+
+    // A value as text: numbers, names of enumerations, texts in quotes, records by their
+    // members, references to definitions by name; what is no value of its property as raw bytes.
+    // Anything that can't be read is "?".
+    virtual std::string Text(IAAFPropertyValue* value) = 0;
+    // Hands over the objects that a value owns, one after the other; false for a value of a
+    // type that owns none.
+    virtual bool TakeObjects(IAAFPropertyValue*, const std::function<void(IAAFObject*)>&) {
+        return false;
+    }
+};
 
 // Reads the property values of one file. What definitions tell, which many values share, is
 // asked of the library once.
@@ -30,18 +47,12 @@ public:
     ValueReader(const ValueReader&) = delete;
     ValueReader& operator=(const ValueReader&) = delete;
 
-    // A value as text: numbers, names of enumerations, texts in quotes, records by their
-    // members, references to definitions by name. Anything that can't be read is "?".
-    std::string Text(IAAFPropertyValue* value);
-    // Hands over the objects that a value owns, one after the other; false for a value of a
-    // type that owns none.
-    bool TakeObjects(IAAFPropertyValue* value, const std::function<void(IAAFObject*)>& take);
+    // Lives as long as the reader.
+    ValueType& TypeOf(IAAFPropertyValue* value);
 
 private:
-    // Null for a value that tells no type.
-    ValueType* TypeOf(IAAFPropertyValue* value);
-
-    std::unordered_map<IAAFTypeDef*, std::unique_ptr<ValueType>> types_;
+    std::unordered_map<IAAFTypeDef*, std::unique_ptr<ValueType>> types_{64};
+    std::unique_ptr<ValueType> raw_;
 };
 
 }  // namespace cliphost

@@ -4,6 +4,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/MachinePath.h"
@@ -18,20 +19,25 @@ namespace {
 using host::DisplayPath;
 using nlohmann::ordered_json;
 
+constexpr std::size_t kRoomForEnds = 64;
+
 // An entry of a list in JSON. `description` is JSON already.
 std::string EntryText(const ordered_json& head, const std::string& description) {
-    std::string lines = head.dump(2, ' ', false, ordered_json::error_handler_t::replace);
+    const std::string lines = head.dump(2, ' ', false, ordered_json::error_handler_t::replace);
     std::string text = "  ";
-    for (const char c : lines) {
-        text += c;
-        if (c == '\n') {
+    text.reserve(lines.size() + description.size() + kRoomForEnds);
+    for (std::size_t at = 0, end = 0; at < lines.size(); at = end) {
+        end = std::min(lines.find('\n', at), lines.size() - 1) + 1;
+        text.append(lines, at, end - at);
+        if (lines[end - 1] == '\n') {
             text += "  ";
         }
     }
     if (!description.empty()) {
         constexpr std::string_view kEnd = "\n  }";
         text.resize(text.size() - kEnd.size());
-        text += ",\n    \"description\": " + description;
+        text += ",\n    \"description\": ";
+        text += description;
         text += kEnd;
     }
     return text;

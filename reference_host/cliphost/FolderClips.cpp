@@ -6,6 +6,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <numeric>
 #include <set>
 #include <string_view>
 
@@ -178,17 +179,28 @@ FolderClips::FolderClips(Session& session, const std::filesystem::path& folder)
         fromBackslash.insert(turned);
     }
     const ncfSInt32 count = list_->GetCount();
+    PathList paths;
+    std::vector<ncfSInt32> indices;
     for (ncfSInt32 i = 0; i < count; ++i) {
         const auto text = host::MakeString(std::string_view());
         std::filesystem::path clip;
         Check(list_->GetClipPath(i, text.get()), "no path of a movie");
         Check(host::PathFrom(text.get(), clip), "a path that no file can have");
         if (fromBackslash.erase(clip) == 0) {
-            clips_.push_back({i, clip.native()});
+            paths.Add(clip.native());
+            indices.push_back(i);
         }
     }
-    std::sort(clips_.begin(), clips_.end(),
-              [](const FolderClip& a, const FolderClip& b) { return a.path < b.path; });
+    clips_ = ClipsByName(std::move(paths), std::move(indices));
+}
+
+ClipsByName::ClipsByName(PathList paths, std::vector<ncfSInt32> indices)
+    : paths_(std::move(paths)), indices_(std::move(indices)), order_(indices_.size()) {
+    paths_.Close();
+    indices_.shrink_to_fit();
+    std::iota(order_.begin(), order_.end(), std::uint32_t{0});
+    std::sort(order_.begin(), order_.end(),
+              [&](std::uint32_t one, std::uint32_t other) { return paths_.IsBefore(one, other); });
 }
 
 }  // namespace cliphost

@@ -2,10 +2,12 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <vector>
 
 #include "host_interfaces/media/MediaVolume.h"
+#include "reference_host/cliphost/PathList.h"
 #include "reference_host/cliphost/Problem.h"
 #include "reference_host/cliphost/Session.h"
 
@@ -14,8 +16,43 @@ namespace cliphost {
 // One movie of the module's list.
 struct FolderClip {
     ncfSInt32 index;  // in the module's list
-    // A path takes five times the memory of its text, and a folder may hold 100,000 movies.
     std::filesystem::path::string_type path;
+};
+
+// The movies of a folder in the order of their names; each is put together when it is asked for.
+class ClipsByName {
+public:
+    // `paths` belong to these indices, one for one.
+    ClipsByName() = default;
+    ClipsByName(PathList paths, std::vector<ncfSInt32> indices);
+
+    std::size_t size() const { return order_.size(); }
+    FolderClip operator[](std::size_t place) const {
+        const std::size_t row = order_[place];
+        return {indices_[row], paths_[row]};
+    }
+
+    class Iterator {
+    public:
+        Iterator(const ClipsByName& clips, std::size_t place) : clips_(&clips), place_(place) {}
+        FolderClip operator*() const { return (*clips_)[place_]; }
+        Iterator& operator++() {
+            ++place_;
+            return *this;
+        }
+        bool operator!=(const Iterator& other) const { return place_ != other.place_; }
+
+    private:
+        const ClipsByName* clips_;
+        std::size_t place_;
+    };
+    Iterator begin() const { return {*this, 0}; }
+    Iterator end() const { return {*this, size()}; }
+
+private:
+    PathList paths_;
+    std::vector<ncfSInt32> indices_;
+    std::vector<std::uint32_t> order_;  // rows of the two above
 };
 
 // Movies of a folder that the module's list lacks, each kind by name.
@@ -50,14 +87,16 @@ class FolderClips {
 public:
     FolderClips(Session& session, const std::filesystem::path& folder);  // throws a Failure
 
-    const std::vector<FolderClip>& clips() const { return clips_; }
+    const ClipsByName& clips() const { return clips_; }
     const OtherMovies& others() const { return others_; }
     NMA::IAAFClips* list() const { return list_.get(); }
+    // The module's list ends; what it said stays.
+    void EndList() { list_.Reset(); }
 
 private:
     OtherMovies others_;
     host::Ref<NMA::IAAFClips> list_;
-    std::vector<FolderClip> clips_;
+    ClipsByName clips_;
 };
 
 }  // namespace cliphost

@@ -4,6 +4,8 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
+#include <cstring>
 #include <nlohmann/json.hpp>
 
 #include "text/Encodings.h"
@@ -23,6 +25,25 @@ constexpr auto kPlain = [] {
 }();
 bool IsPlain(char c) {
     return kPlain[static_cast<unsigned char>(c)];
+}
+
+// Whether eight characters are plain. A character that is not leaves the highest bit of its byte,
+// or of one above it.
+bool ArePlain(const char* eight) {
+    constexpr std::uint64_t kEach = 0x0101010101010101;
+    std::uint64_t all = 0;
+    std::memcpy(&all, eight, sizeof all);
+    const std::uint64_t marks = all | (all - kEach * ' ') | (all + kEach) |
+                                ((all ^ kEach * '"') - kEach) | ((all ^ kEach * '\\') - kEach);
+    return (marks & kEach * 0x80) == 0;
+}
+
+// The first character that is not plain, or the end.
+const char* EndOfPlain(const char* at, const char* end) {
+    while (end - at >= 8 && ArePlain(at)) {
+        at += 8;
+    }
+    return std::find_if_not(at, end, IsPlain);
 }
 
 // Goes through a text from its start to its end.
@@ -92,8 +113,8 @@ private:
         }
         const char* const start = at_;
         bool isAscii = true;
-        for (at_ = std::find_if_not(at_, end_, IsPlain); at_ != end_ && *at_ != '"';
-             at_ = std::find_if_not(at_ + 1, end_, IsPlain)) {
+        for (at_ = EndOfPlain(at_, end_); at_ != end_ && *at_ != '"';
+             at_ = EndOfPlain(at_ + 1, end_)) {
             if (*at_ == '\\' && !TakeEscaped()) {
                 return false;
             }
@@ -134,11 +155,12 @@ private:
 void AppendJsonText(std::string_view text, std::string& json) {
     const std::size_t before = json.size();
     json += '"';
-    for (auto at = text.begin(); at != text.end();) {
-        const auto end = std::find_if_not(at, text.end(), IsPlain);
-        json.append(at, end);
-        at = end;
-        if (at != text.end()) {
+    const char* const end = text.data() + text.size();
+    for (const char* at = text.data(); at != end;) {
+        const char* const special = EndOfPlain(at, end);
+        json.append(at, static_cast<std::size_t>(special - at));
+        at = special;
+        if (at != end) {
             if (*at != '"' && *at != '\\') {  // controls, and what may be no text at all
                 json.resize(before);
                 json += nlohmann::json(text).dump(-1, ' ', false,

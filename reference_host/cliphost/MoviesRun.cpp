@@ -45,12 +45,13 @@ int MoviesRun::Run() {
     }
     Plan();
     RefuseOneForAllOntoMovie();
-    const auto movies = std::count_if(steps_.begin(), steps_.end(),
-                                      [](const MovieStep& step) { return step.IsMovie(); });
-    // A descriptor is that of this process.
-    const bool isOurs = std::any_of(steps_.begin(), steps_.end(), [](const MovieStep& step) {
-        return host::system::NamesDescriptor(step.movie);
-    });
+    std::size_t movies = 0;
+    bool isOurs = false;  // a descriptor is that of this process
+    for (std::size_t i = 0; i < steps_.size(); ++i) {
+        const MovieStep step = StepAt(i);
+        movies += step.IsMovie() ? 1 : 0;
+        isOurs = isOurs || host::system::NamesDescriptor(step.movie);
+    }
     const bool isForWorkers =
         options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
     if (isForWorkers) {
@@ -62,11 +63,26 @@ int MoviesRun::Run() {
     return status_;
 }
 
+void MoviesRun::Add(MovieStep step) {
+    steps_.push_back({kNoList, static_cast<std::uint32_t>(others_.size())});
+    others_.push_back(std::move(step));
+}
+
+MovieStep MoviesRun::StepAt(std::size_t number) const {
+    const Planned& planned = steps_[number];
+    if (planned.list == kNoList) {
+        return others_[planned.place];
+    }
+    const std::shared_ptr<FolderClips>& folder = folders_[planned.list];
+    FolderClip clip = folder->clips()[planned.place];
+    return {std::move(clip.path), folder, clip.index, {}, {}};
+}
+
 void MoviesRun::Plan() {
     for (const std::filesystem::path& path : options_.paths) {
         std::error_code ignored;
         if (!std::filesystem::is_directory(path, ignored)) {
-            steps_.push_back({path.native(), {}, 0, {}, {}});
+            Add({path.native(), {}, 0, {}, {}});
             continue;
         }
         try {
@@ -82,7 +98,7 @@ void MoviesRun::PlanFolder(const std::filesystem::path& folder) {
     if (!IsClaimed(session_, path.get())) {
         throw Failure(kExitFile, NotClaimed(folder));
     }
-    const auto clips = std::make_shared<const FolderClips>(session_, folder);
+    const auto clips = std::make_shared<FolderClips>(session_, folder);
     for (const std::filesystem::path& name : clips->others().withBackslash) {
         Refuse(name, kExitCaller, BackslashProblem(name));
     }
@@ -90,22 +106,25 @@ void MoviesRun::PlanFolder(const std::filesystem::path& folder) {
         Refuse(problem.subject, kExitCaller, problem);
     }
     if (const Problem leftOut = LeftOut(folder, clips->others())) {
-        steps_.push_back({folder.native(), {}, 0, {}, std::make_shared<const Problem>(leftOut)});
+        Add({folder.native(), {}, 0, {}, std::make_shared<const Problem>(leftOut)});
     }
-    for (const FolderClip& clip : clips->clips()) {
-        steps_.push_back({clip.path, clips, clip.index, {}, {}});
+    const auto list = static_cast<std::uint32_t>(folders_.size());
+    folders_.push_back(clips);
+    steps_.reserve(steps_.size() + clips->clips().size());
+    for (std::uint32_t place = 0; place < clips->clips().size(); ++place) {
+        steps_.push_back({list, place});
     }
 }
 
 void MoviesRun::Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
-    steps_.push_back({path.native(), {}, 0, std::make_shared<const Failure>(status, problem), {}});
+    Add({path.native(), {}, 0, std::make_shared<const Failure>(status, problem), {}});
 }
 
 // It is written when all movies were read: none of them may be there.
 void MoviesRun::RefuseOneForAllOntoMovie() const {
     if (!options_.together.empty() && host::system::NumberOf(options_.together)) {
-        for (const MovieStep& step : steps_) {
-            RefuseOutputOntoMovie(options_.together, step.movie);
+        for (std::size_t i = 0; i < steps_.size(); ++i) {
+            RefuseOutputOntoMovie(options_.together, StepAt(i).movie);
         }
     }
 }
@@ -114,7 +133,8 @@ void MoviesRun::RunHere() {
     if (steps_.size() > 1) {
         progress_.emplace(doing_, steps_.size());
     }
-    for (const MovieStep& step : steps_) {
+    for (std::size_t i = 0; i < steps_.size(); ++i) {
+        const MovieStep step = StepAt(i);
         if (progress_) {
             progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
         }
@@ -147,21 +167,25 @@ std::filesystem::path MoviesRun::PlaceToWrite() const {
 }
 
 void MoviesRun::RunInChildren() {
-    std::vector<std::string> requests;
     for (std::size_t i = 0; i < steps_.size(); ++i) {
-        if (steps_[i].IsMovie()) {
-            steps_[i].folder.reset();
-            requests.push_back(steps_[i].movie);
-            placesOfRequests_.push_back(i);
+        if (StepAt(i).IsMovie()) {
+            placesOfRequests_.push_back(static_cast<std::uint32_t>(i));
         }
     }
+    // The children open each movie by its path.
+    for (const std::shared_ptr<FolderClips>& folder : folders_) {
+        folder->EndList();
+    }
+    const WorkerRequests requests = {placesOfRequests_.size(), [this](std::size_t number) {
+                                         return StepAt(placesOfRequests_[number]).movie;
+                                     }};
     WorkerCall call = options_.workers;
     if (!options_.together.empty()) {
         call.writeNear = host::system::TemporaryFolder();
     } else if (options_.Saves()) {
         call.writeNear = PlaceToWrite();
     }
-    progress_.emplace(doing_, requests.size());
+    progress_.emplace(doing_, requests.count);
     RunInWorkers(call, requests, *this);
     progress_.reset();
     TellThoseBefore(steps_.size());
@@ -169,7 +193,7 @@ void MoviesRun::RunInChildren() {
 
 void MoviesRun::TellThoseBefore(std::size_t place) {
     for (; nextPlace_ < place; ++nextPlace_) {
-        TellInstead(steps_[nextPlace_]);
+        TellInstead(StepAt(nextPlace_));
     }
 }
 
@@ -181,9 +205,10 @@ void MoviesRun::Take(std::size_t number, const WorkerResult& result) {
     const std::size_t place = placesOfRequests_[number];
     TellThoseBefore(place);
     ++nextPlace_;
-    progress_->Step(DisplayPath(std::filesystem::path(steps_[place].movie).filename()));
+    const MovieStep step = StepAt(place);
+    progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
     Notice("{}", result.told);
-    GoOnAfterFailure(steps_[place].movie, [&] { Deliver(steps_[place], number, result); });
+    GoOnAfterFailure(step.movie, [&] { Deliver(step, number, result); });
     answers_.erase(number);
 }
 
@@ -249,9 +274,8 @@ std::filesystem::path MoviesRun::TargetFor(const std::filesystem::path& movie) {
     for (int number = 1; target.empty(); ++number) {
         std::filesystem::path name = movie.stem();
         name += number == 1 ? ending_ : fmt::format("-{}{}", number, ending_);
-        const std::filesystem::path free = options_.outFolder / name;
-        if (targetsTaken_.insert(free).second) {
-            target = free;
+        if (targetsTaken_.insert(name.native()).second) {
+            target = options_.outFolder / name;
         }
     }
     const auto inItsPlace = host::system::NumberOf(target);

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <map>
 #include <memory>
@@ -95,12 +96,23 @@ private:
     const MoviesOptions& options_;
     const char* doing_;
     const char* ending_;
-    std::vector<MovieStep> steps_;
-    std::vector<std::size_t> placesOfRequests_;  // among the steps
+    // Of movies out of lists only which they are: there may be 100,000.
+    struct Planned {
+        std::uint32_t list;   // among the folders; kNoList: `place` is one among the others
+        std::uint32_t place;  // among its movies
+    };
+    static constexpr std::uint32_t kNoList = 0xFFFFFFFF;
+    void Add(MovieStep step);
+    MovieStep StepAt(std::size_t number) const;
+
+    std::vector<Planned> steps_;
+    std::vector<std::shared_ptr<FolderClips>> folders_;
+    std::vector<MovieStep> others_;
+    std::vector<std::uint32_t> placesOfRequests_;  // among the steps
     std::size_t nextPlace_ = 0;
     std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
     std::optional<Progress> progress_;
-    std::set<std::filesystem::path> targetsTaken_;
+    std::set<std::string> targetsTaken_;  // names in the folder
     PathsByFile given_;
     int done_ = 0;
     int failed_ = 0;

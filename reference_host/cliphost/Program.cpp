@@ -61,6 +61,19 @@ std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
                        host::text::PrintableLines(text));
 }
 
+// Each verb's help ends with it.
+void TellExitStatus(CLI::App& app) {
+    const std::string text =
+        "Exit status: 0, everything was done; 1, the content of a file is at fault; 2, the call "
+        "is at fault:\na wrong option, a file that does not exist, an output that can't be "
+        "written. Of several failures\nthe highest counts.";
+    app.footer(text);
+    for (CLI::App* const verb : app.get_subcommands([](CLI::App*) { return true; })) {
+        const std::string own = verb->get_footer();
+        verb->footer(own.empty() ? text : own + "\n\n" + text);
+    }
+}
+
 int Run(int argc, char** argv) {
     using namespace cliphost;
     SessionOptions session;
@@ -74,10 +87,6 @@ int Run(int argc, char** argv) {
     app.name("cliphost");
     app.require_subcommand(1);
     app.fallthrough();
-    app.footer(
-        "Exit status: 0, everything was done; 1, the content of a file is at fault; 2, the call "
-        "is at fault:\na wrong option, a file that does not exist, an output that can't be "
-        "written. Of several failures\nthe highest counts.");
     app.set_version_flag("--version", "cliphost " PRODUCT_VERSION_TEXT);
     app.add_flag("-v", session.verbosity,
                  "Show the module's console lines on standard error; -vv shows its log too");
@@ -104,6 +113,8 @@ int Run(int argc, char** argv) {
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);
+    AddHelpFiles(app);
+    TellExitStatus(app);
 
     RefuseEmptyTexts(app);
     TakeFileUrls(app);

@@ -26,7 +26,7 @@ namespace {
 constexpr aafUID_t kTopLevel = ncfGuid("0D010102-0101-0700-060E-2B3404010101");
 constexpr aafFrameOffset_t kSecondsAtStart = 3600;
 
-enum class Track { None, Picture, Sound };
+enum class MediaKind { None, Picture, Sound };
 
 struct Part {
     aafSlotID_t slot;
@@ -62,10 +62,10 @@ aafUID_t DataOf(IAAFMobSlot& slot) {
     return id;
 }
 
-Track TrackOf(const aafUID_t& id) {
-    return id == kAAFDataDef_Picture || id == kAAFDataDef_LegacyPicture ? Track::Picture
-           : id == kAAFDataDef_Sound || id == kAAFDataDef_LegacySound   ? Track::Sound
-                                                                        : Track::None;
+MediaKind TrackOf(const aafUID_t& id) {
+    return id == kAAFDataDef_Picture || id == kAAFDataDef_LegacyPicture ? MediaKind::Picture
+           : id == kAAFDataDef_Sound || id == kAAFDataDef_LegacySound   ? MediaKind::Sound
+                                                                        : MediaKind::None;
 }
 
 // Whole frames of the sequence in a slot; 0 where it has no length.
@@ -101,10 +101,11 @@ Clip ClipOf(IAAFMob& mob, const aafRational_t& rate) {
             continue;
         }
         const aafUID_t data = DataOf(*slot);
-        const Track track = TrackOf(data);
-        const aafLength_t frames = track == Track::None ? 0 : FramesIn(*slot, rate);
+        const MediaKind track = TrackOf(data);
+        const aafLength_t frames = track == MediaKind::None ? 0 : FramesIn(*slot, rate);
         if (frames > 0) {
-            (track == Track::Picture ? clip.pictures : clip.sounds).push_back({id, data, frames});
+            (track == MediaKind::Picture ? clip.pictures : clip.sounds)
+                .push_back({id, data, frames});
         }
     }
     return clip;

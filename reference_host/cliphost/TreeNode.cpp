@@ -9,42 +9,49 @@
 namespace cliphost {
 namespace {
 
+constexpr std::size_t kUsualJson = 16384;
+
 std::string Margin(int level) {
     return std::string(static_cast<std::size_t>(level) * 2, ' ');
 }
 
 // A new line for a member of a JSON object that has others before it, and its name.
-void AppendJsonName(const std::string& margin, const std::string& name, std::string& out) {
-    out += ",\n";
-    out += margin;
+void AppendJsonName(const std::string& newLine, const std::string& name, std::string& out) {
+    out += ',';
+    out += newLine;
     AppendJsonText(name, out);
     out += ": ";
 }
 
-void AppendJson(const TreeNode& node, int level, std::string& out) {
-    const std::string margin = Margin(level + 1);
-    out += "{\n";
-    out += margin;
+// The new line is the one of the object's members: its margin goes before them.
+void AppendJson(const TreeNode& node, std::string& newLine, std::string& out) {
+    out += '{';
+    out += newLine;
     out += "\"class\": ";
     AppendJsonText(node.title, out);
     for (const TreeNode::Fact& fact : node.facts) {
-        AppendJsonName(margin, fact.name, out);
+        AppendJsonName(newLine, fact.name, out);
         AppendJsonText(fact.value, out);
     }
     for (const TreeNode::Branch& branch : node.branches) {
-        AppendJsonName(margin, branch.name, out);
-        const char* before = "[\n";
+        AppendJsonName(newLine, branch.name, out);
+        out += '[';
+        const char* before = "";
         for (const TreeNode& child : branch.nodes) {
             out += before;
-            out += margin;
+            out += newLine;
             out += "  ";
-            AppendJson(child, level + 2, out);
-            before = ",\n";
+            newLine += "    ";
+            AppendJson(child, newLine, out);
+            newLine.resize(newLine.size() - 4);
+            before = ",";
         }
-        out += branch.nodes.empty() ? "[]" : "\n" + margin + "]";
+        if (!branch.nodes.empty()) {
+            out += newLine;
+        }
+        out += ']';
     }
-    out += '\n';
-    out.append(margin, 0, margin.size() - 2);
+    out.append(newLine, 0, newLine.size() - 2);
     out += '}';
 }
 
@@ -94,7 +101,9 @@ std::string ToText(const TreeNode& node, int indent) {
 
 std::string ToJson(const TreeNode& node, int level) {
     std::string out;
-    AppendJson(node, level, out);
+    out.reserve(kUsualJson);
+    std::string newLine = '\n' + Margin(level + 1);
+    AppendJson(node, newLine, out);
     return out;
 }
 

@@ -20,6 +20,7 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status);
 void AddTypes(CLI::App& app, const SessionOptions& session, int& status);
 void AddParams(CLI::App& app, const SessionOptions& session, int& status);
 void AddDump(CLI::App& app, const SessionOptions& session);
+void AddHelpFiles(CLI::App& app);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
 
 }  // namespace cliphost

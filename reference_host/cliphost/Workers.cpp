@@ -65,10 +65,10 @@ std::string TakeTold(Worker& worker) {
 
 class Run {
 public:
-    Run(const WorkerCall& call, const std::vector<std::string>& requests, WorkerClient& client)
+    Run(const WorkerCall& call, const WorkerRequests& requests, WorkerClient& client)
         : call_(call), requests_(requests), client_(client) {
         MakeScratchFolder();
-        const std::size_t most = std::min<std::size_t>(call.jobs, requests.size());
+        const std::size_t most = std::min<std::size_t>(call.jobs, requests.count);
         for (std::size_t i = 0; i < most; ++i) {
             workers_.push_back(std::make_unique<Worker>());
         }
@@ -96,7 +96,7 @@ private:
     void Settle(Worker& worker, const std::string& failure);
 
     const WorkerCall& call_;
-    const std::vector<std::string>& requests_;
+    const WorkerRequests& requests_;
     WorkerClient& client_;
     std::optional<host::system::ScratchFolder> scratch_;
     std::size_t foldersMade_ = 0;
@@ -129,7 +129,7 @@ void Run::MakeScratchFolder() {
 }
 
 void Run::GoOn() {
-    while (taken_ < requests_.size()) {
+    while (taken_ < requests_.count) {
         HandOut();
         const Clock::time_point idle = Clock::now();
         LeaveOut(idle - heard_);
@@ -204,7 +204,7 @@ void Run::HandTo(Worker& worker, std::size_t request) {
     worker.requests.push_back(request);
     // A process that takes nothing has ended; Listen finds that.
     worker.process.Send(
-        FieldWriter().Add(std::uint64_t{request}).Add(requests_[request]).Message());
+        FieldWriter().Add(std::uint64_t{request}).Add(requests_.text(request)).Message());
 }
 
 std::optional<std::size_t> Run::NextRequest() {
@@ -213,7 +213,7 @@ std::optional<std::size_t> Run::NextRequest() {
         again_.pop_front();
         return request;
     }
-    if (next_ == requests_.size() || next_ - taken_ >= call_.mostWaiting) {
+    if (next_ == requests_.count || next_ - taken_ >= call_.mostWaiting) {
         return std::nullopt;
     }
     return next_++;
@@ -366,6 +366,11 @@ void Run::Settle(Worker& worker, const std::string& failure) {
 
 void RunInWorkers(const WorkerCall& call, const std::vector<std::string>& requests,
                   WorkerClient& client) {
+    RunInWorkers(call, {requests.size(), [&](std::size_t number) { return requests[number]; }},
+                 client);
+}
+
+void RunInWorkers(const WorkerCall& call, const WorkerRequests& requests, WorkerClient& client) {
     // Takes effect once processes and folders are gone.
     const host::system::DelayedSignals signals;
     Run(call, requests, client).GoOn();

@@ -54,7 +54,14 @@ public:
     virtual void Take(std::size_t number, const WorkerResult& result) = 0;
 };
 
+// Requests that are put together when they are sent.
+struct WorkerRequests {
+    std::size_t count;
+    std::function<std::string(std::size_t number)> text;
+};
+
 // Gives requests to processes. Throws a Failure when none can be started.
+void RunInWorkers(const WorkerCall& call, const WorkerRequests& requests, WorkerClient& client);
 void RunInWorkers(const WorkerCall& call, const std::vector<std::string>& requests,
                   WorkerClient& client);
 

@@ -102,7 +102,23 @@ NCFRESULT String::AssignUnits(ncfUInt32 keepAs, const Unit* text, ncfUInt32 unit
     });
 }
 
+void String::HoldUtf8(std::string_view text) {
+    if (auto* const held = std::get_if<std::string>(&units_)) {
+        held->assign(text);  // which may be its own
+    } else {
+        units_ = std::string(text);
+    }
+    encoding_ = kNCFUTF8;
+}
+
 NCFRESULT String::AssignUTF8(ncfUInt32 keepAs, const ncfUTF8* text, ncfUInt32 units) {
+    if (keepAs == kNCFUTF8) {
+        return Guarded([&] {
+            Need(text != nullptr || units == 0);
+            HoldUtf8(View(text, units));
+            return NCF_OK;
+        });
+    }
     return AssignUnits(keepAs, text, units, encodings::FromUtf8);
 }
 
@@ -157,6 +173,11 @@ Ref<String> MakeString(std::u32string_view text, ncfUInt32 encoding) {
 }
 
 Ref<String> MakeString(std::string_view utf8, ncfUInt32 encoding) {
+    if (encoding == kNCFUTF8) {
+        Ref<String> string = MakeRef<String>();
+        string->HoldUtf8(utf8);
+        return string;
+    }
     return MakeString(encodings::FromUtf8(utf8), encoding);
 }
 

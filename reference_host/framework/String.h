@@ -38,6 +38,8 @@ public:
     std::u32string Text() const;
     // Holds `text` in `encoding`; NCF_E_FAIL, unchanged, when it has no place.
     NCFRESULT SetText(std::u32string_view text, ncfUInt32 encoding);
+    // The same of a text that is to stay in UTF-8: its bytes as they are.
+    void HoldUtf8(std::string_view text);
 
 private:
     template <class Unit, class Decode>

@@ -42,7 +42,9 @@ std::optional<ncfUInt32> HeaderReport::ShownTrack() const {
 
 HeaderReport InspectHeaders(const std::filesystem::path& file) {
     HeaderReport report;
-    std::ifstream stream(file, std::ios::binary);
+    std::ifstream stream;
+    stream.rdbuf()->pubsetbuf(nullptr, 0);  // each read has a place of its own, and few bytes
+    stream.open(file, std::ios::binary);
     std::error_code error;
     report.fileSize = std::filesystem::file_size(file, error);
     if (!stream || error) {

@@ -1,45 +1,39 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include <openssl/evp.h>
+
+// The digest itself and not the library's way of choosing one: to look it up by its name
+// first sets up all that the library has, which takes longer than a short movie's digest. The
+// functions are marked as old for the sake of that choice, which nobody has here.
+#define OPENSSL_SUPPRESS_DEPRECATED
+#include <openssl/sha.h>
 
 #include "reference_host/system/DigestEngine.h"
 
 namespace host::system {
 
+static_assert(kDigestBytes == SHA256_DIGEST_LENGTH);
+
 struct DigestEngine::Handle {
-    EVP_MD_CTX* context = nullptr;
+    SHA256_CTX context;
+    bool ready;
 };
 
-// Found once for the process: the library searches its providers for each name. Like
-// the library itself it stays until the end.
-static const EVP_MD* Sha256() {
-    static const EVP_MD* const digest = EVP_MD_fetch(nullptr, "SHA256", nullptr);
-    return digest;
-}
-
 DigestEngine::DigestEngine() : handle_(std::make_unique<Handle>()) {
-    EVP_MD_CTX* context = EVP_MD_CTX_new();
-    if (context != nullptr && EVP_DigestInit_ex(context, Sha256(), nullptr) != 1) {
-        EVP_MD_CTX_free(context);
-        context = nullptr;
-    }
-    handle_->context = context;
+    handle_->ready = SHA256_Init(&handle_->context) == 1;
 }
 
-DigestEngine::~DigestEngine() {
-    EVP_MD_CTX_free(handle_->context);
-}
+DigestEngine::~DigestEngine() = default;
 
 bool DigestEngine::IsReady() const {
-    return handle_->context != nullptr;
+    return handle_->ready;
 }
 
 bool DigestEngine::Add(const unsigned char* data, std::size_t size) {
-    return EVP_DigestUpdate(handle_->context, data, size) == 1;
+    return SHA256_Update(&handle_->context, data, size) == 1;
 }
 
 bool DigestEngine::Finish(std::array<unsigned char, kDigestBytes>& digest) {
-    return EVP_DigestFinal_ex(handle_->context, digest.data(), nullptr) == 1;
+    return SHA256_Final(digest.data(), &handle_->context) == 1;
 }
 
 }  // namespace host::system

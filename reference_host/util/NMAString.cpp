@@ -7,7 +7,6 @@
 #include "reference_host/util/Factory.h"
 #include "reference_host/util/NMAStringState.h"
 #include "reference_host/util/RefusingString.h"
-#include "text/Encodings.h"
 
 namespace text = host::text;
 using host::util::Quietly;
@@ -23,7 +22,7 @@ NMAString::NMAString(const char* utf8) : NMAString() {
         return;
     }
     state_->encoding = kNCFUTF8;
-    Quietly([&] { state_->text = encodings::FromUtf8(utf8 == nullptr ? "" : utf8); });
+    Quietly([&] { state_->TakeUtf8(utf8 == nullptr ? "" : utf8); });
 }
 
 NMAString::NMAString(INCFString* source, ncfUInt32 encoding) : NMAString() {
@@ -31,7 +30,7 @@ NMAString::NMAString(INCFString* source, ncfUInt32 encoding) : NMAString() {
         return;
     }
     state_->encoding = encoding <= kNCFWCHAR ? encoding : kNCFUTF16;
-    Quietly([&] { state_->text = text::Read(source); });
+    Quietly([&] { state_->Read(source); });
 }
 
 NMAString::~NMAString() {
@@ -42,20 +41,18 @@ NMAString& NMAString::operator=(const NMAString& other) {
     if (this == &other || state_ == nullptr) {
         return *this;
     }
-    std::u32string copy;
-    ncfUInt32 encoding = kNCFUTF16;
+    State copy;
     if (other.state_ != nullptr) {
         const std::lock_guard<std::mutex> guard(other.state_->mutex);
         Quietly([&] {
             other.state_->LookAtShown();
-            copy = other.state_->text;
+            copy.TakeFrom(*other.state_);
         });
-        encoding = other.state_->encoding;
+        copy.encoding = other.state_->encoding;
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
     state_->shown.Reset();
-    state_->Take(std::move(copy));
-    state_->encoding = encoding;
+    state_->TakeOver(copy);
     return *this;
 }
 
@@ -63,15 +60,21 @@ bool NMAString::operator==(const NMAString& other) const {
     if (this == &other) {
         return true;
     }
-    const auto copyOf = [](const NMAString& string) {
+    const auto copyOf = [](const NMAString& string, State& copy) {
         if (string.state_ == nullptr) {
-            return std::u32string();
+            return;
         }
         const std::lock_guard<std::mutex> guard(string.state_->mutex);
         string.state_->LookAtShown();
-        return string.state_->text;
+        copy.TakeFrom(*string.state_);
     };
-    return Quietly(false, [&] { return copyOf(*this) == copyOf(other); });
+    return Quietly(false, [&] {
+        State mine;
+        State others;
+        copyOf(*this, mine);
+        copyOf(other, others);
+        return mine.Equals(others);
+    });
 }
 
 NMAString& NMAString::operator+=(const NMAString& tail) {
@@ -82,7 +85,8 @@ NMAString& NMAString::operator+=(const NMAString& tail) {
     const std::lock_guard<std::mutex> guard(state_->mutex);
     Quietly([&] {
         state_->LookAtShown();
-        std::u32string joined = state_->text + copy.state_->text;
+        // By characters: bytes that are no UTF-8 stay apart even where together they were some.
+        std::u32string joined = state_->Characters() + copy.state_->Characters();
         state_->shown.Reset();
         state_->Take(std::move(joined));
     });
@@ -96,7 +100,7 @@ bool NMAString::IsEmpty() const {
     const std::lock_guard<std::mutex> guard(state_->mutex);
     return Quietly(true, [&] {
         state_->LookAtShown();
-        return state_->text.empty();
+        return state_->IsEmpty();
     });
 }
 
@@ -123,9 +127,9 @@ INCFString* NMAString::InArg() const {
         return host::util::RefusingString();
     }
     const NCFRESULT filled = Quietly(NCF_E_OUTOFMEMORY, [&] {
-        const NCFRESULT result = text::Assign(made.get(), state_->text, state_->encoding);
+        const NCFRESULT result = text::Assign(made.get(), state_->Characters(), state_->encoding);
         // Text that has no form in the wanted encoding is shown all the same.
-        return result >= 0 ? result : text::Assign(made.get(), state_->text, kNCFUTF16);
+        return result >= 0 ? result : text::Assign(made.get(), state_->Characters(), kNCFUTF16);
     });
     if (filled < 0) {
         return host::util::RefusingString();
@@ -140,18 +144,18 @@ INCFString** NMAString::OutArg() {
         return &nowhere;
     }
     const std::lock_guard<std::mutex> guard(state_->mutex);
-    state_->Take({});
+    state_->TakeUtf8({});
     return state_->shown.Out();
 }
 
 const char* NMAString::GetUTF8String() const {
-    return state_ == nullptr ? "" : state_->Shown(&State::utf8, encodings::ToUtf8Lossy, "");
+    return state_ == nullptr ? "" : state_->Shown(&State::Utf8, "");
 }
 
 const ncfUTF16* NMAString::GetUTF16String() const {
-    return state_ == nullptr ? u"" : state_->Shown(&State::utf16, encodings::ToUtf16Lossy, u"");
+    return state_ == nullptr ? u"" : state_->Shown(&State::Utf16, u"");
 }
 
 const wchar_t* NMAString::GetWCHARString() const {
-    return state_ == nullptr ? L"" : state_->Shown(&State::wide, encodings::ToWideLossy, L"");
+    return state_ == nullptr ? L"" : state_->Shown(&State::Wide, L"");
 }

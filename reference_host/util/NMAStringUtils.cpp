@@ -20,7 +20,7 @@ NMAString NMAStringUtils::CreateWCharNMAString(const wchar_t* characters, ncfSIn
     Quietly([&] {
         const std::size_t units =
             length == -1 ? std::wcslen(characters) : static_cast<std::size_t>(length);
-        made.state_->text = encodings::FromWide({characters, units});
+        made.state_->Take(encodings::FromWide({characters, units}));
     });
     return made;
 }
@@ -30,10 +30,13 @@ NMAString NMAStringUtils::GetParentFolder(const NMAString& path) {
     if (folder.state_ == nullptr) {
         return folder;
     }
-    std::u32string& characters = folder.state_->text;
-    while (!characters.empty() && !host::system::IsSeparator(characters.back())) {
-        characters.pop_back();
-    }
+    Quietly([&] {
+        std::u32string characters = folder.state_->Characters();
+        while (!characters.empty() && !host::system::IsSeparator(characters.back())) {
+            characters.pop_back();
+        }
+        folder.state_->Take(std::move(characters));
+    });
     return folder;
 }
 
@@ -42,10 +45,13 @@ NMAString NMAStringUtils::CombinePath(const NMAString& folder, const NMAString& 
     if (path.state_ == nullptr) {
         return path;
     }
-    std::u32string& characters = path.state_->text;
-    if (!characters.empty() && !host::system::IsSeparator(characters.back())) {
-        Quietly([&] { characters.push_back(U'\\'); });
-    }
+    Quietly([&] {
+        std::u32string characters = path.state_->Characters();
+        if (!characters.empty() && !host::system::IsSeparator(characters.back())) {
+            characters.push_back(U'\\');
+            path.state_->Take(std::move(characters));
+        }
+    });
     path += name;
     return path;
 }

@@ -12,6 +12,28 @@ namespace host {
 
 namespace {
 
+// A host string that is lent for one call after the other. A receiver that keeps it has it: the
+// next call gets a new one.
+class LentString {
+public:
+    INCFString* With(std::string_view utf8) {
+        if (string_ && IsOursAlone()) {
+            string_->HoldUtf8(utf8);
+        } else {
+            string_ = MakeString(utf8, kNCFUTF8);
+        }
+        return string_.get();
+    }
+
+private:
+    bool IsOursAlone() const {
+        string_->AddRef();
+        return string_->Release() == 1;
+    }
+
+    Ref<String> string_;
+};
+
 // Hands events on as host strings, which live for the call.
 class HandlerEvents final : public XmlEvents {
 public:
@@ -21,20 +43,21 @@ public:
         if (handler_ == nullptr) {
             return NCF_OK;
         }
-        NCFRESULT result = handler_->Element(MakeString(name, kNCFUTF8).get());
+        NCFRESULT result = handler_->Element(name_.With(name));
         for (; result >= 0 && *attributes != nullptr; attributes += 2) {
-            result = handler_->Attribute(MakeString(attributes[0], kNCFUTF8).get(),
-                                         MakeString(attributes[1], kNCFUTF8).get());
+            result = handler_->Attribute(name_.With(attributes[0]), text_.With(attributes[1]));
         }
         return result;
     }
 
     NCFRESULT OnText(std::string_view text) override {
-        return handler_ == nullptr ? NCF_OK : handler_->Text(MakeString(text, kNCFUTF8).get());
+        return handler_ == nullptr ? NCF_OK : handler_->Text(text_.With(text));
     }
 
 private:
     UTIL::INCFSaxDocumentHandler* handler_;
+    LentString name_;
+    LentString text_;
 };
 
 }  // namespace

@@ -3,6 +3,8 @@
 
 #include "source/components/QuickTimeMasterClips.h"
 
+#include <cstring>
+
 #include "host_interfaces/util/NMAStringUtils.h"
 #include "host_interfaces/util/NMAVolume.h"
 #include "source/aaf/NewAAFFromMovie.h"
@@ -32,21 +34,38 @@ void QuickTimeMasterClips::Scan() {
          file = volume.GetNextFile(handle)) {
         const NMAString name(file, kNCFUTF16);
         file->Release();
-        if (!NMAStringUtils::IsStartWith(name, ".")) {
-            _MCList.push_back(NMAStringUtils::CombinePath(folder_, name));
+        if (NMAStringUtils::IsStartWith(name, ".")) {
+            continue;
         }
+        const char* utf8 = name.GetUTF8String();
+        if (NMAString(utf8) != name) {
+            otherNames_.emplace(GetCount(), name);
+            utf8 = "";
+        }
+        starts_.push_back(names_.size());
+        names_.append(utf8, std::strlen(utf8) + 1);
     }
+    names_.shrink_to_fit();
+    starts_.shrink_to_fit();
+}
+
+NMAString QuickTimeMasterClips::PathOf(ncfSInt32 index) const {
+    const auto other = otherNames_.find(index);
+    return NMAStringUtils::CombinePath(
+        folder_, other != otherNames_.end()
+                     ? other->second
+                     : NMAString(&names_[starts_[static_cast<std::size_t>(index)]]));
 }
 
 ncfSInt32 QuickTimeMasterClips::GetCount() {
-    return static_cast<ncfSInt32>(_MCList.size());
+    return static_cast<ncfSInt32>(starts_.size());
 }
 
 NCFRESULT QuickTimeMasterClips::GetClipPath(ncfSInt32 index, INCFString* path) {
     if (index < 0 || index >= GetCount() || !path) {
         return NCF_E_INVALIDARG;
     }
-    return ResultOf([&] { return path->Assign(_MCList[static_cast<std::size_t>(index)].InArg()); });
+    return ResultOf([&] { return path->Assign(PathOf(index).InArg()); });
 }
 
 NCFRESULT QuickTimeMasterClips::GetMetadata(ncfSInt32 index, IAAFFile** ppData) {
@@ -59,7 +78,9 @@ NCFRESULT QuickTimeMasterClips::GetMetadata(ncfSInt32 index, IAAFFile** ppData) 
     }
     return ResultOf([&]() -> NCFRESULT {
         std::tr1::shared_ptr<BaseClip> media;
-        NCF_RETURN(LoadMedia(_MCList[index].InArg(), _pConsole, _pComponentFactory, media));
+        const NMAString path = PathOf(index);
+        NCF_RETURN_TEXT("LoadMedia(_MCList[index].InArg(), _pConsole, _pComponentFactory, media)",
+                        LoadMedia(path.InArg(), _pConsole, _pComponentFactory, media));
         *ppData = nullptr;
         NCF_RETURN_TEXT("NewAAFFromMovie(media, _pConsole, ppData, _pComponentFactory)",
                         NewAAFFromMovie(media, _pConsole, ppData, _pComponentFactory.inArg()));

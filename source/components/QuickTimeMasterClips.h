@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstddef>
+#include <map>
+#include <string>
 #include <vector>
 
 #include "host_interfaces/framework/Console.h"
@@ -31,8 +34,15 @@ public:
     void Scan();
 
 private:
+    // The full path of a movie that the list has.
+    NMAString PathOf(ncfSInt32 index) const;
+
     NMAString folder_;
-    std::vector<NMAString> _MCList;  // full paths
+    // The names of the movies in UTF-8, one after the other, each with its zero: a folder may hold
+    // 100,000. Those that have no form in UTF-8 are kept apart and are empty here.
+    std::string names_;
+    std::vector<std::size_t> starts_;
+    std::map<ncfSInt32, NMAString> otherNames_;
     NCFSmartPtr<INCFComponentFactory> _pComponentFactory;
     NCFSmartPtr<INCFConsole> _pConsole;
 };

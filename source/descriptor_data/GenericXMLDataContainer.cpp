@@ -102,14 +102,13 @@ bool GenericXMLDataContainer::FindValueParent(XMLDataPropertyValue** valueParent
         declaredParent->GetDesc(&description) < 0 || !description) {
         return true;
     }
-    return currentValue_ && currentValue_->FindNextProperty(description->NameText(), valueParent) !=
-                                kPropertyNotFound;
+    *valueParent = currentValue_ ? currentValue_->NearestNamed(description->NameText()) : nullptr;
+    return *valueParent != nullptr;
 }
 
 XMLDataPropertyValue* GenericXMLDataContainer::MakeValueNode(
     const XMLDataPropertyDescription* description) {
-    valueNodes_.push_back(std::make_unique<XMLDataPropertyValue>(description));
-    return valueNodes_.back().get();
+    return &valueNodes_.emplace_back(description);
 }
 
 void GenericXMLDataContainer::AddValueElement(const XMLDataPropertyDescription* description,

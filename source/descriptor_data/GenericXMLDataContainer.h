@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstring>
+#include <deque>
 #include <map>
 #include <memory>
 #include <ostream>
@@ -81,7 +82,7 @@ private:
     bool expectText_ = false;                               // the next text is a value
     bool entryOpen_ = false;
     Entries entries_;
-    std::vector<std::unique_ptr<XMLDataPropertyValue>> valueNodes_;
+    std::deque<XMLDataPropertyValue> valueNodes_;  // of the parse; they stay where they are
     std::vector<std::unique_ptr<XMLDataPropertyValue>> descriptionNodes_;
     std::vector<std::unique_ptr<XMLDataPropertyDescription>> descriptions_;
 };

@@ -17,7 +17,7 @@ void PrintIndent(std::ostream& stream, int indent) {
     }
 }
 
-void PrintLine(std::ostream& stream, int indent, const char* label, const char* text) {
+void PrintLine(std::ostream& stream, int indent, const char* label, std::string_view text) {
     PrintIndent(stream, indent);
     stream << std::left << std::setw(kLabelColumns) << label << text << "\n";
 }

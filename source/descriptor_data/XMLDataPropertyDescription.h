@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <string_view>
+
 #include "host_interfaces/framework/Types.h"
 #include "host_interfaces/util/NMAString.h"
 
@@ -24,10 +26,10 @@ public:
     const NMAString& GetName() const { return name_; }
     ncfUInt32 GetKind() const { return kind_; }
     // The name as searches compare it.
-    const char* NameText() const { return nameText_; }
+    std::string_view NameText() const { return nameText_; }
 
 private:
     const NMAString name_;
     const ncfUInt32 kind_;
-    const char* const nameText_;  // lies in name_
+    const std::string_view nameText_;  // lies in name_
 };

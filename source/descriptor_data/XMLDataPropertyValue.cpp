@@ -3,8 +3,6 @@
 
 #include "source/descriptor_data/XMLDataPropertyValue.h"
 
-#include <cstring>
-
 #include "source/plugin/ResultChecks.h"
 
 XMLDataPropertyValue::XMLDataPropertyValue(const XMLDataPropertyDescription* description)
@@ -14,8 +12,24 @@ XMLDataPropertyValue::XMLDataPropertyValue(const XMLDataPropertyDescription* des
     }
 }
 
-bool XMLDataPropertyValue::IsNamed(const char* property) const {
-    return std::strcmp(description_->NameText(), property) == 0;
+XMLDataPropertyValue* XMLDataPropertyValue::NearestNamed(std::string_view property) {
+    for (XMLDataPropertyValue* node = this; node; node = node->parent_) {
+        XMLDataPropertyValue* const found =
+            node->IsNamed(property) ? node : node->FirstChildNamed(property);
+        if (found) {
+            return found;
+        }
+    }
+    return nullptr;
+}
+
+XMLDataPropertyValue* XMLDataPropertyValue::FirstChildNamed(std::string_view property) const {
+    for (XMLDataPropertyValue* child : children_) {
+        if (child->IsNamed(property)) {
+            return child;
+        }
+    }
+    return nullptr;
 }
 
 NCFRESULT XMLDataPropertyValue::GetDesc(const XMLDataPropertyDescription** outDesc) const {
@@ -26,14 +40,14 @@ NCFRESULT XMLDataPropertyValue::GetDesc(const XMLDataPropertyDescription** outDe
 }
 
 NCFRESULT XMLDataPropertyValue::SetValue(const NMAString& value) {
-    value_ = value;
+    value_ = value.GetUTF8String();
     return NCF_OK;
 }
 
 NCFRESULT XMLDataPropertyValue::GetValue(NMAString* outValue) const {
     NCF_FUNCTION("XMLDataPropertyValue::GetValue");
     CHK_INARG(outValue);
-    *outValue = value_;
+    *outValue = NMAString(value_.c_str());
     return NCF_OK;
 }
 
@@ -63,25 +77,18 @@ NCFRESULT XMLDataPropertyValue::FindNextProperty(const char* property,
                                                  XMLDataPropertyValue** dataPropertyValue) {
     NCF_FUNCTION("XMLDataPropertyValue::FindNextProperty");
     CHK_INARG(dataPropertyValue);
-    for (XMLDataPropertyValue* node = this; node; node = node->parent_) {
-        if (node->IsNamed(property)) {
-            *dataPropertyValue = node;
-            return NCF_OK;
-        }
-        if (node->FindPropertyInChildren(property, dataPropertyValue) != kPropertyNotFound) {
-            return NCF_OK;
-        }
-    }
-    return kPropertyNotFound;
+    *dataPropertyValue = NearestNamed(property);
+    return *dataPropertyValue ? NCF_OK : kPropertyNotFound;
 }
 
 NCFRESULT XMLDataPropertyValue::FindPropertyInChildren(
     const char* property, std::vector<XMLDataPropertyValue*>* dataPropertyValueVect) const {
     NCF_FUNCTION("XMLDataPropertyValue::FindPropertyInChildren");
     CHK_INARG(dataPropertyValueVect);
+    const std::string_view name = property;
     NCFRESULT result = kPropertyNotFound;
     for (XMLDataPropertyValue* child : children_) {
-        if (child->IsNamed(property)) {
+        if (child->IsNamed(name)) {
             dataPropertyValueVect->push_back(child);
             result = NCF_OK;
         }
@@ -93,12 +100,6 @@ NCFRESULT XMLDataPropertyValue::FindPropertyInChildren(
     const char* property, XMLDataPropertyValue** dataPropertyValue) const {
     NCF_FUNCTION("XMLDataPropertyValue::FindPropertyInChildren");
     CHK_INARG(dataPropertyValue);
-    *dataPropertyValue = nullptr;
-    for (XMLDataPropertyValue* child : children_) {
-        if (child->IsNamed(property)) {
-            *dataPropertyValue = child;
-            return NCF_OK;
-        }
-    }
-    return kPropertyNotFound;
+    *dataPropertyValue = FirstChildNamed(property);
+    return *dataPropertyValue ? NCF_OK : kPropertyNotFound;
 }

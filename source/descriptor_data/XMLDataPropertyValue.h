@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <string>
+#include <string_view>
 #include <vector>
 
 #include "host_interfaces/framework/ResultCodes.h"
@@ -28,6 +30,8 @@ public:
     // Searches outward: this node, its children, then the same from its parent
     // on. 0 found, kPropertyNotFound otherwise.
     NCFRESULT FindNextProperty(const char* property, XMLDataPropertyValue** dataPropertyValue);
+    // The same; null when there is none.
+    XMLDataPropertyValue* NearestNamed(std::string_view property);
     // Searches the direct children; the first form appends every match, the
     // second gives the first, null when there is none.
     NCFRESULT FindPropertyInChildren(
@@ -36,14 +40,15 @@ public:
                                      XMLDataPropertyValue** dataPropertyValue) const;
 
     // The value in UTF-8, valid until it is set anew.
-    const char* ValueText() const { return value_.GetUTF8String(); }
+    const char* ValueText() const { return value_.c_str(); }
     const std::vector<XMLDataPropertyValue*>& Children() const { return children_; }
 
 private:
-    bool IsNamed(const char* property) const;
+    bool IsNamed(std::string_view property) const { return description_->NameText() == property; }
+    XMLDataPropertyValue* FirstChildNamed(std::string_view property) const;
 
     const XMLDataPropertyDescription* description_;
-    NMAString value_;
+    std::string value_;  // in UTF-8, as it is read; there are thousands
     XMLDataPropertyValue* parent_ = nullptr;
     std::vector<XMLDataPropertyValue*> children_;
 };

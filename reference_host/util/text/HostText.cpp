@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/util/text/HostText.h"
 
+#include <utility>
+
 #include "text/Encodings.h"
 
 namespace host::text {
@@ -10,8 +12,8 @@ namespace {
 
 // Reads the buffer that one of the raw accessors shows.
 template <class Unit, class Decode>
-std::u32string ReadRaw(INCFString* string, NCFRESULT (INCFString::*accessor)(Unit**),
-                       Decode decode) {
+auto ReadRaw(INCFString* string, NCFRESULT (INCFString::*accessor)(Unit**), Decode decode)
+    -> decltype(decode({})) {
     Unit* units = nullptr;
     if ((string->*accessor)(&units) < 0 || units == nullptr) {
         return {};
@@ -21,14 +23,15 @@ std::u32string ReadRaw(INCFString* string, NCFRESULT (INCFString::*accessor)(Uni
 
 }  // namespace
 
-std::u32string Read(INCFString* string) {
+AsHeld ReadAsHeld(INCFString* string) {
     if (string == nullptr) {
         return {};
     }
     switch (string->GetEncoding()) {
         case kNCFASCII:
         case kNCFUTF8:
-            return ReadRaw(string, &INCFString::GetRawUTF8, encodings::FromUtf8);
+            return ReadRaw(string, &INCFString::GetRawUTF8,
+                           [](std::string_view units) { return std::string(units); });
         case kNCFUTF16:
             return ReadRaw(string, &INCFString::GetRawUTF16, encodings::FromUtf16);
         case kNCFUTF32:
@@ -41,8 +44,17 @@ std::u32string Read(INCFString* string) {
     }
 }
 
+std::u32string Read(INCFString* string) {
+    AsHeld held = ReadAsHeld(string);
+    const auto* const utf8 = std::get_if<std::string>(&held);
+    return utf8 != nullptr ? encodings::FromUtf8(*utf8) : std::move(std::get<std::u32string>(held));
+}
+
 std::string ReadUtf8(INCFString* string) {
-    return encodings::ToUtf8Lossy(Read(string));
+    AsHeld held = ReadAsHeld(string);
+    auto* const utf8 = std::get_if<std::string>(&held);
+    return utf8 != nullptr ? std::move(*utf8)
+                           : encodings::ToUtf8Lossy(std::get<std::u32string>(held));
 }
 
 NCFRESULT Assign(INCFString* string, std::u32string_view text, ncfUInt32 keepAs) {

@@ -4,6 +4,7 @@
 
 #include <string>
 #include <string_view>
+#include <variant>
 
 #include "host_interfaces/framework/String.h"
 
@@ -13,6 +14,9 @@ namespace host::text {
 
 // The text of `string`, which is borrowed; null: empty.
 std::u32string Read(INCFString* string);
+// The same, left in UTF-8 where the string holds that. Back and forth gives the same bytes.
+using AsHeld = std::variant<std::string, std::u32string>;
+AsHeld ReadAsHeld(INCFString* string);
 // The same as UTF-8, for messages: never fails.
 std::string ReadUtf8(INCFString* string);
 

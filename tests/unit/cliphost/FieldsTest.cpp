@@ -79,8 +79,8 @@ MovieAnswer Described() {
     return answer;
 }
 
-constexpr DescriptionForm kText{false, false};
-constexpr DescriptionForm kJson{true, false};
+const DescriptionForm kText{false, false};
+const DescriptionForm kJson{true, false};
 
 TEST(MovieAnswer, ComesBackAsItWas) {
     const MovieAnswer sent = Described();

@@ -36,6 +36,26 @@ TEST(JsonText, IsReadAsTheTextForEveryCharacterOfAscii) {
     }
 }
 
+TEST(JsonText, IsReadAsTheTextWhereverACharacterStands) {
+    for (int c = 0; c < 128; ++c) {
+        for (std::size_t place = 0; place < 17; ++place) {
+            std::string text(17, 'a');
+            text[place] = static_cast<char>(c);
+            EXPECT_EQ(nlohmann::json::parse(InJson(text)), text) << c << ' ' << place;
+            EXPECT_TRUE(IsJsonOfTexts(InJson(text))) << c << ' ' << place;
+            EXPECT_EQ(IsJsonOfTexts('"' + text + '"'), nlohmann::json::accept('"' + text + '"'))
+                << c << ' ' << place;
+        }
+    }
+    for (std::size_t place = 0; place < 17; ++place) {
+        std::string text(17, 'a');
+        text[place] = '\xFF';
+        EXPECT_EQ(InJson(text),
+                  '"' + text.substr(0, place) + "\xEF\xBF\xBD" + text.substr(place + 1) + '"');
+        EXPECT_FALSE(IsJsonOfTexts('"' + text + '"')) << place;
+    }
+}
+
 TEST(JsonText, TakesObjectsListsAndTexts) {
     for (const char* const json :
          {R"("a")", R"([])", R"({})", R"( [ "a" , [ ] , { } ] )", R"({"a":"b","c":[{"d":[]},"e"]})",

@@ -17,7 +17,7 @@ protected:
 
 TEST_F(XMLDataPropertyValueTest, DescriptionKeepsNameAndKind) {
     EXPECT_STREQ(otherDescription_.GetName().GetUTF8String(), "other");
-    EXPECT_STREQ(otherDescription_.NameText(), "other");
+    EXPECT_EQ(otherDescription_.NameText(), "other");
     EXPECT_EQ(otherDescription_.GetKind(), 2u);
 }
 

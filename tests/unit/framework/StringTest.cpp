@@ -102,6 +102,16 @@ TEST(String, AFailedAssignmentLeavesItUnchanged) {
     EXPECT_EQ(1, string->IsEmpty());
 }
 
+TEST(String, MayBeAssignedAPartOfItself) {
+    const auto string = MakeString("one \xFF two", kNCFUTF8);
+    char* units = nullptr;
+    ASSERT_EQ(NCF_OK, string->GetRawUTF8(&units));
+    EXPECT_EQ(NCF_OK, string->AssignUTF8(kNCFUTF8, units + 4, 5));
+    ASSERT_EQ(NCF_OK, string->GetRawUTF8(&units));
+    EXPECT_STREQ("\xFF two", units);
+    EXPECT_EQ(U"\xDCFF two", string->Text());
+}
+
 TEST(String, AssignTakesTextAndEncoding) {
     const auto source = MakeString(kMixed, kNCFUTF32);
     const auto string = MakeString("before", kNCFUTF8);

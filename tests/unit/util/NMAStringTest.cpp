@@ -93,6 +93,29 @@ TEST_F(NMAStringTest, CarriesBytesThatAreNoUtf8) {
     EXPECT_EQ(0xDCE9, string.GetUTF16String()[1]);
 }
 
+// Joined, they would be one character, but neither was part of one.
+TEST_F(NMAStringTest, KeepsBytesApartThatWereNoUtf8EachForItself) {
+    NMAString string("\xC3");
+    string += NMAString("\xA9");
+    EXPECT_STREQ("\xC3\xA9", string.GetUTF8String());
+    EXPECT_EQ(std::u16string({0xDCC3, 0xDCA9}), string.GetUTF16String());
+    EXPECT_TRUE(string != NMAString("\xC3\xA9"));
+    const NMAString copy(string);
+    EXPECT_EQ(std::u16string({0xDCC3, 0xDCA9}), copy.GetUTF16String());
+}
+
+// Its UTF-8 is for reading only: a copy has what it stands for.
+TEST_F(NMAStringTest, KeepsWhatHasNoFormInUtf8AfterThatWasShown) {
+    const auto source = host::MakeString(std::u32string_view(U"a\xD800"), kNCFUTF16);
+    const NMAString string(source.get(), kNCFUTF16);
+    EXPECT_STREQ("a\xEF\xBF\xBD", string.GetUTF8String());
+    EXPECT_TRUE(string != NMAString("a\xEF\xBF\xBD"));
+    NMAString copy;
+    copy = string;
+    EXPECT_EQ(std::u16string({u'a', 0xD800}), copy.GetUTF16String());
+    EXPECT_TRUE(copy == string);
+}
+
 TEST_F(NMAStringTest, ShowsTextThatItsEncodingCannotHoldInUtf16) {
     const auto source = host::MakeString("caf\xC3\xA9");
     const NMAString string(source.get(), kNCFASCII);

@@ -141,3 +141,40 @@ TEST_F(SaxParserTest, RefusesArgumentsThatMakeNoSense) {
     EXPECT_EQ(NCF_E_INVALIDARG, parser_->Parse(1, File("<a/>").get()));
     EXPECT_EQ(NCF_E_INVALIDARG, parser_->Parse(0, host::MakeString("").get()));
 }
+
+namespace {
+
+// Keeps every string that it is lent, and spoils those that it does not keep.
+class KeepingHandler final : public host::Component<UTIL::INCFSaxDocumentHandler> {
+public:
+    NCFRESULT Start() override { return NCF_OK; }
+    NCFRESULT End() override { return NCF_OK; }
+    NCFRESULT Element(INCFString* tag) override { return Keep(tag); }
+    NCFRESULT Attribute(INCFString* name, INCFString* value) override {
+        name->AssignUTF16(kNCFUTF16, u"spoilt", kNCFZeroTerminated);
+        return Keep(value);
+    }
+    NCFRESULT Text(INCFString* text) override { return Keep(text); }
+
+    std::vector<host::Ref<INCFString>> kept;
+
+private:
+    NCFRESULT Keep(INCFString* string) {
+        EXPECT_EQ(static_cast<ncfUInt32>(kNCFUTF8), string->GetEncoding());
+        kept.emplace_back(string);
+        return NCF_OK;
+    }
+};
+
+}  // namespace
+
+TEST_F(SaxParserTest, AStringThatAHandlerKeepsStaysAsItWas) {
+    const auto keeper = host::MakeRef<KeepingHandler>();
+    parser_->SetDocumentHandler(keeper.get());
+    ASSERT_EQ(NCF_OK, Parse("<a one='1' two='22'>text<b>more</b></a>"));
+    std::vector<std::string> texts;
+    for (const host::Ref<INCFString>& string : keeper->kept) {
+        texts.push_back(host::text::ReadUtf8(string.get()));
+    }
+    EXPECT_EQ((std::vector<std::string>{"a", "1", "22", "text", "b", "more"}), texts);
+}

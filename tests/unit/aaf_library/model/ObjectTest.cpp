@@ -19,6 +19,18 @@ protected:
     }
     Ptr<IAAFPropertyValue> Get() { return Out(mob, &IAAFObject::GetPropertyValue, own.get()); }
 
+    // Two properties on the mob: `own`, and then one more.
+    void SetTwoProperties() {
+        constexpr aafUID_t kSecondId = ncfGuid("5B0E7D53-3C41-4E0B-8E2C-91B0B0F4D7A2");
+        ASSERT_EQ(Class(AUID_AAFMob)
+                      ->RegisterOptionalPropertyDef(kSecondId, L"Second",
+                                                    Type(kAAFTypeID_Int32).get(), nullptr),
+                  AAFRESULT_SUCCESS);
+        const auto second = PropertyOf(AUID_AAFMob, kSecondId);
+        ASSERT_EQ(mob->SetPropertyValue(own.get(), Int32Value(4).get()), AAFRESULT_SUCCESS);
+        ASSERT_EQ(mob->SetPropertyValue(second.get(), Int32Value(5).get()), AAFRESULT_SUCCESS);
+    }
+
     Ptr<IAAFPropertyDef> own;
     Ptr<IAAFObject> mob;
 };
@@ -54,6 +66,44 @@ TEST_F(Objects, OneValueOnTwoObjectsBecomesACopyOnTheSecond) {
     const auto copy = Out(other, &IAAFObject::GetPropertyValue, own.get());
     EXPECT_NE(copy.get(), value.get());
     EXPECT_EQ(NumberOf(copy), 7);
+}
+
+TEST_F(Objects, PropertyThatIsKeptStaysWhatItIsWhenTheNextIsGiven) {
+    SetTwoProperties();
+    const auto list = Out(mob, &IAAFObject::GetProperties);
+    const auto first = Out(list, &IEnumAAFProperties::NextOne);
+    const auto second = Out(list, &IEnumAAFProperties::NextOne);
+    EXPECT_NE(first.get(), second.get());
+    EXPECT_EQ(NumberOf(Out(first, &IAAFProperty::GetValue)) +
+                  NumberOf(Out(second, &IAAFProperty::GetValue)),
+              4 + 5);
+    EXPECT_NE(Out(first, &IAAFProperty::GetDefinition).get(),
+              Out(second, &IAAFProperty::GetDefinition).get());
+}
+
+TEST_F(Objects, PropertyThatIsGivenBackMakesPlaceForTheNext) {
+    SetTwoProperties();
+    const auto list = Out(mob, &IAAFObject::GetProperties);
+    const auto first =
+        NumberOf(Out(Out(list, &IEnumAAFProperties::NextOne), &IAAFProperty::GetValue));
+    const auto second =
+        NumberOf(Out(Out(list, &IEnumAAFProperties::NextOne), &IAAFProperty::GetValue));
+    EXPECT_NE(first, second);
+    EXPECT_EQ(first + second, 4 + 5);
+}
+
+TEST_F(Objects, ClonedListOfPropertiesGoesOnFromTheSamePlaceOnItsOwn) {
+    SetTwoProperties();
+    const auto list = Out(mob, &IAAFObject::GetProperties);
+    const auto first = Out(list, &IEnumAAFProperties::NextOne);
+    const auto number = NumberOf(Out(first, &IAAFProperty::GetValue));
+    const auto clone = Out(list, &IEnumAAFProperties::Clone);
+    const auto second = Out(list, &IEnumAAFProperties::NextOne);
+    const auto again = Out(clone, &IEnumAAFProperties::NextOne);
+    EXPECT_NE(second.get(), again.get());
+    EXPECT_EQ(NumberOf(Out(second, &IAAFProperty::GetValue)), 4 + 5 - number);
+    EXPECT_EQ(NumberOf(Out(again, &IAAFProperty::GetValue)), 4 + 5 - number);
+    EXPECT_EQ(NumberOf(Out(first, &IAAFProperty::GetValue)), number);
 }
 
 TEST_F(Objects, PropertyOfAnotherClassIsRefused) {

@@ -33,6 +33,24 @@ TEST(StoredTexts, LoneSurrogatesPassBothWays) {
     EXPECT_EQ(aaf::FromUtf16(aaf::Bytes{0x3C, 0xD8}.data(), 2).size(), 1u);
 }
 
+TEST(StoredTexts, AreCountedAndCopiedAsTheyAreRead) {
+    for (const aaf::Bytes& stored :
+         {aaf::Bytes{}, aaf::Bytes{0x61}, aaf::Bytes{0x61, 0, 0x7F, 0}, aaf::Bytes{0x61, 0, 0x62},
+          aaf::Bytes{0x80, 0}, aaf::Bytes{0x61, 1}, aaf::Bytes{0x61, 0, 0x3C, 0xD8, 0xAC, 0xDF}}) {
+        const std::wstring text = aaf::FromUtf16(stored.data(), stored.size());
+        EXPECT_EQ(aaf::CountOfUtf16(stored.data(), stored.size()), text.size());
+        wchar_t buffer[8] = {};
+        const std::size_t bytes = text.size() * sizeof(wchar_t);
+        EXPECT_EQ(aaf::CopyUtf16(stored.data(), stored.size(), buffer, bytes), AAFRESULT_SUCCESS);
+        EXPECT_EQ(std::wstring(buffer, text.size()), text);
+        EXPECT_EQ(buffer[text.size()], L'\0');
+        if (bytes > 0) {
+            EXPECT_EQ(aaf::CopyUtf16(stored.data(), stored.size(), buffer, bytes - 1),
+                      AAFRESULT_SMALLBUF);
+        }
+    }
+}
+
 TEST(StoredTexts, OddByteAtTheEndIsDropped) {
     const aaf::Bytes stored{0x61, 0, 0x62};
     EXPECT_EQ(aaf::TextOfStored(stored), L"a");

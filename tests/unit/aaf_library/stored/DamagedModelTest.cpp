@@ -94,11 +94,11 @@ StoredObject passed(const StoredObject& tree) {
 
 // The value that callers get of a property that was kept.
 PropertyValue& shown(Object& object, const PropertyKey& key) {
-    const auto found = object.values().find(key.pid);
-    if (found == object.values().end()) {
+    PropertyValue* const found = object.values().Find(key.pid);
+    if (found == nullptr) {
         throw std::logic_error("no such value");
     }
-    return *found->second;
+    return *found;
 }
 
 bool IsDefined(PropertyValue& value) {

@@ -35,6 +35,9 @@ INCFString* NMAVolume::GetNextFile(void*& handle) {
     }
     handle = name + 1;
     INCFString* const made = MakeHostString(*name);
+    if (volumeDouble.change) {
+        volumeDouble.change(*made);
+    }
     volumeDouble.handedOut.push_back(made);
     return made;
 }

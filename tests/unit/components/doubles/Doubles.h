@@ -18,8 +18,9 @@ struct VolumeDouble {
     std::vector<std::string> names;
     std::map<std::string, ncfUInt64> dates;
     bool throws = false;
-    std::vector<std::string> paths;     // of the volumes so far
-    std::vector<std::string> patterns;  // of the searches so far
+    std::function<void(INCFString&)> change;  // of a name before it is handed out
+    std::vector<std::string> paths;           // of the volumes so far
+    std::vector<std::string> patterns;        // of the searches so far
     std::vector<NCFSmartPtr<INCFString>> handedOut;
 };
 extern VolumeDouble volumeDouble;

@@ -90,6 +90,31 @@ TEST_F(Scans, KeepTheOrderOfTheFileSystem) {
     }
 }
 
+// As a file system may have them whose names are UTF-16 in name only.
+TEST_F(Scans, KeepANameThatHasNoFormInUtf8) {
+    volumeDouble.names = {"a.mov", "odd.mov", "b.mov"};
+    const std::u16string odd = {u'o', 0xD800, u'.', u'm', u'o', u'v'};
+    volumeDouble.change = [&](INCFString& name) {
+        if (TextOf(&name) == "odd.mov") {
+            name.AssignUTF16(kNCFUTF16, odd.data(), static_cast<ncfUInt32>(odd.size()));
+        }
+    };
+    NCFSmartPtr<NMA::IMediaFormat> format;
+    NCFSmartPtr<NMA::IAAFClips> clips;
+    volume->GetMediaFormat(text("\\f").inArg(), format.outArg());
+    ASSERT_EQ(format->GetAAFClips(clips.outArg()), NCF_OK);
+    ASSERT_EQ(clips->GetCount(), 3);
+    const std::u16string paths[] = {u"\\f\\a.mov", u"\\f\\" + odd, u"\\f\\b.mov"};
+    for (ncfSInt32 i = 0; i < 3; ++i) {
+        const auto place = text("");
+        ASSERT_EQ(clips->GetClipPath(i, place.inArg()), NCF_OK);
+        place->ConvertTo(kNCFUTF16);
+        ncfUTF16* units = nullptr;
+        ASSERT_EQ(place->GetRawUTF16(&units), NCF_OK);
+        EXPECT_EQ(std::u16string(units, place->GetLength()), paths[i]) << i;
+    }
+}
+
 TEST_F(Scans, PassTheVolumesFactsOn) {
     ncfUInt32 serial = 0;
     ncfUInt32 type = 0;

@@ -19,6 +19,20 @@ TEST(HostText, ReadsNullAsEmpty) {
     EXPECT_EQ("", text::ReadUtf8(nullptr));
 }
 
+TEST(HostText, LeavesUtf8AsItIsAndReadsTheRestAsCharacters) {
+    const text::AsHeld utf8("caf\xC3\xA9 \xFF");
+    const text::AsHeld characters(U"caf\u00E9 \xDCFF");
+    const auto string = host::MakeString("caf\xC3\xA9 \xFF", kNCFUTF8);
+    EXPECT_EQ(utf8, text::ReadAsHeld(string.get()));
+    for (const ncfUInt32 encoding : {kNCFUTF16, kNCFUTF32, kNCFWCHAR}) {
+        ASSERT_EQ(NCF_OK, string->ConvertTo(encoding));
+        EXPECT_EQ(characters, text::ReadAsHeld(string.get())) << encoding;
+        EXPECT_EQ("caf\xC3\xA9 \xFF", text::ReadUtf8(string.get())) << encoding;
+    }
+    EXPECT_EQ(text::AsHeld("plain"), text::ReadAsHeld(host::MakeString("plain", kNCFASCII).get()));
+    EXPECT_EQ(text::AsHeld(), text::ReadAsHeld(nullptr));
+}
+
 TEST(HostText, AssignsInTheWantedEncoding) {
     const auto string = host::MakeRef<host::String>();
     EXPECT_EQ(NCF_OK, text::Assign(string.get(), U"\u20AC", kNCFUTF8));

@@ -1,0 +1,50 @@
+#!/usr/bin/env bash
+# check_package.sh PACKAGE.deb: installs it into an empty root, describes a movie with what lies
+# there, removes it, and looks for what is left. Its dependencies are those of this machine.
+set -euo pipefail
+package=$(realpath "$1")
+root=$(mktemp -d)
+trap 'rm -rf "$root"' EXIT
+fail() { printf 'check_package: %s\n' "$*" >&2; exit 1; }
+
+mkdir -p "$root/var/lib/dpkg/"{info,updates,triggers}
+touch "$root/var/lib/dpkg/"{status,available}
+packages() {
+  dpkg --root="$root" --force-not-root --force-depends --log=/dev/null "$@" >"$root.log" 2>&1 \
+    || { cat "$root.log" >&2; fail "dpkg $* failed"; }
+  rm -f "$root.log"
+}
+packages --install "$package"
+
+program=$root/usr/bin/cliphost
+"$program" --version >/dev/null || fail "the program does not start"
+ffmpeg -v error -f lavfi -i testsrc2=size=64x48:rate=25 -frames:v 5 -c:v mjpeg "$root/clip.mov"
+"$program" describe -q "$root/clip.mov" --aaf "$root/clip.aaf" >/dev/null || fail "describe failed"
+"$program" dump "$root/clip.aaf" | grep -q 'mob 3: SourceMob' || fail "the description is not whole"
+rm "$root/clip.mov" "$root/clip.aaf"
+
+for file in usr/share/man/man1/cliphost.1 usr/share/man/man1/cliphost-describe.1 \
+            usr/share/bash-completion/completions/cliphost \
+            usr/share/zsh/vendor-completions/_cliphost \
+            usr/share/fish/vendor_completions.d/cliphost.fish \
+            usr/share/doc/cliphost/copyright; do
+  [ -s "$root/$file" ] || fail "$file is missing"
+done
+bash -n "$root/usr/share/bash-completion/completions/cliphost" || fail "bash does not read its completion"
+if command -v groff >/dev/null; then
+  for page in "$root"/usr/share/man/man1/*.1; do
+    said=$(groff -man -Tutf8 -ww "$page" 2>&1 >/dev/null)
+    [ -z "$said" ] || fail "groff of ${page##*/}: $said"
+  done
+fi
+
+# A header alone, as a module of another maker would have it.
+flags=$(PKG_CONFIG_PATH=$root/usr/share/pkgconfig PKG_CONFIG_SYSROOT_DIR=$root \
+        pkg-config --cflags host_interfaces)
+printf '#include "host_interfaces/framework/PluginEntry.h"\n' \
+  | g++ -std=c++17 -fsyntax-only $flags -x c++ - || fail "the headers do not compile"
+
+packages --purge cliphost
+left=$(cd "$root" && find . -path ./var/lib/dpkg -prune -o ! -type d -print)
+[ -z "$left" ] || fail "the package leaves $left"
+printf 'the package installs, describes a movie, and leaves nothing when removed\n'
