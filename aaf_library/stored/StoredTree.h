@@ -80,6 +80,11 @@ struct StoredProperty {
     std::uint16_t keyPid = 0;
     std::uint8_t keySize = 16;
 
+    // Strong set: the number in the name of each object's storage, no two alike.
+    // Unless there are as many as objects, they are numbered in the order of
+    // their keys. Two trees that differ in these are equal.
+    std::vector<std::uint32_t> localKeys;
+
     // Weak forms: the pids from the root object down to the strong set that
     // holds the targets.
     std::vector<std::uint16_t> targetPath;

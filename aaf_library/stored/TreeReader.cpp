@@ -229,6 +229,7 @@ private:
             if (isSet) {
                 from.TakeNumber<std::uint32_t>();  // the count of references
                 property.keys.push_back(from.TakeBytes(property.keySize));
+                property.localKeys.push_back(localKey);
             }
             property.objects.push_back(ReadContained(storage, ElementName(name, localKey), depth));
         }

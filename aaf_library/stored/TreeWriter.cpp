@@ -307,8 +307,12 @@ private:
         const std::u16string name = CollectionName(property.name, property.pid);
         const std::vector<std::size_t> order = KeyOrder(property);
         const auto count = static_cast<std::uint32_t>(order.size());
+        const bool isNumbered = property.localKeys.size() == order.size() && count != 0;
+        const std::uint32_t firstFree =
+            isNumbered ? *std::max_element(property.localKeys.begin(), property.localKeys.end()) + 1
+                       : count;
         ByteWriter index;
-        index.AppendNumber(count).AppendNumber(count).AppendNumber(kNoLastFreeKey);
+        index.AppendNumber(count).AppendNumber(firstFree).AppendNumber(kNoLastFreeKey);
         index.AppendNumber(property.keyPid).AppendNumber(CheckedKeySize(property));
         for (std::uint32_t i = 0; i < count; ++i) {
             const StoredObject& object = property.objects[order[i]];
@@ -318,8 +322,9 @@ private:
             if (!hasKey && property.problem.empty()) {
                 throw StoredError("an element does not store its key");
             }
-            index.AppendNumber(i).AppendNumber(kSetReferenceCount).Append(key);
-            layout.children.push_back({ElementName(name, i), &object});
+            const std::uint32_t localKey = isNumbered ? property.localKeys[order[i]] : i;
+            index.AppendNumber(localKey).AppendNumber(kSetReferenceCount).Append(key);
+            layout.children.push_back({ElementName(name, localKey), &object});
         }
         layout.AddName(property, name);
         layout.streams.push_back({IndexName(name), index.Take(), nullptr});

@@ -128,7 +128,7 @@ TEST(MetaDictionary, LaysOutARecordTypeByteForByte) {
         return reader.entry(storage).contained.at(name);
     };
     const std::uint32_t definition = inside(
-        inside(CompoundFileReader::kRootIndex, u"MetaDictionary-1"), u"TypeDefinitions-4{0}");
+        inside(CompoundFileReader::kRootIndex, u"MetaDictionary-1"), u"TypeDefinitions-4{50}");
     EXPECT_EQ(GuidOf(reader.entry(definition).classId),
               ncfGuid("0D010101-020D-0000-060E-2B3402060101"));
 
