@@ -295,6 +295,29 @@ StoredObject StoredMetaDictionary(const MetaRecords& records) {
     return MetaDictionaryOf(records, StoredBuiltInClass, StoredBuiltInType);
 }
 
+StoredObject StoredDataDefinition(const BuiltInDefinition& entry) {
+    StoredObject object;
+    object.classId = AuidOf(AUID_AAFDataDefinition);
+    const auto add = [&](const PropertyKey& key, Bytes value) {
+        StoredProperty property;
+        property.pid = key.pid;
+        property.bytes = std::move(value);
+        object.properties.push_back(std::move(property));
+    };
+    const auto text = [](const char* ascii) {
+        return ByteWriter().AppendText(Utf16Of(Widen(ascii))).bytes();
+    };
+    add(prop::DefinitionObject_Identification, IdBytes(entry.id));
+    add(prop::DefinitionObject_Name, text(entry.name));
+    add(prop::DefinitionObject_Description, text(entry.description));
+    return object;
+}
+
+StoredObject LaidOutDataDefinition(const BuiltInDefinition& entry) {
+    static LaidOutTable<BuiltInDefinition> table(BuiltInDataDefinitions(), StoredDataDefinition);
+    return table.Definition(entry);
+}
+
 StoredObject LaidOutMetaDictionary(const MetaRecords& records) {
     static KeptDictionaries kept;
     if (std::optional<StoredObject> known = kept.Find(records)) {

@@ -50,6 +50,10 @@ StoredObject StoredMetaDictionary(const MetaRecords& records);
 // The same for writing alone: what files have in common is laid out once.
 StoredObject LaidOutMetaDictionary(const MetaRecords& records);
 
+// A definition of data as the built-in model has it; the second is for writing alone.
+StoredObject StoredDataDefinition(const BuiltInDefinition& entry);
+StoredObject LaidOutDataDefinition(const BuiltInDefinition& entry);
+
 // Definitions of a kind that nobody knows are passed over, those that make no sense are left out
 // and noted. Throws StoredError when there is no set of classes or of types.
 MetaRecords ReadMetaDictionary(const StoredObject& metaDictionary);

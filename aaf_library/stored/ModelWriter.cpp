@@ -30,17 +30,12 @@ using Path = std::vector<std::uint16_t>;
 
 constexpr std::size_t kIdSize = sizeof(StoredAuid);
 
-bool IsBuiltInDefinition(const Bytes& id) {
+bool IsBuiltInContainer(const Bytes& id) {
     const GUID wanted = GuidOf(id);
-    for (Span<BuiltInDefinition> table :
-         {BuiltInDataDefinitions(), BuiltInContainerDefinitions()}) {
-        for (const BuiltInDefinition& definition : table) {
-            if (definition.id == wanted) {
-                return true;
-            }
-        }
-    }
-    return false;
+    const Span<BuiltInDefinition> table = BuiltInContainerDefinitions();
+    return std::any_of(table.begin(), table.end(), [&](const BuiltInDefinition& definition) {
+        return definition.id == wanted;
+    });
 }
 
 bool IsWeak(StoredForm form) {
@@ -59,10 +54,13 @@ void SortByPid(StoredObject& object) {
 
 class ModelWriter {
 public:
-    using MetaDictionary = StoredObject (*)(const MetaRecords&);
+    // What is written of definitions that files have in common.
+    struct Common {
+        StoredObject (*metaDictionary)(const MetaRecords&);
+        StoredObject (*dataDefinition)(const BuiltInDefinition&);
+    };
 
-    ModelWriter(Model& model, MetaDictionary metaDictionary)
-        : model_(model), closure_(model), metaDictionary_(metaDictionary) {}
+    ModelWriter(Model& model, Common common) : model_(model), closure_(model), common_(common) {}
 
     // The content stands in place of the header's own; it may be of another model.
     StoredObject Write(Object& header, const Object* content) {
@@ -78,7 +76,7 @@ public:
         StoredObject root;
         root.classId = kRootClassId;
         root.properties.push_back(ReferenceTo(meta::kRootMetaDictionary, u"MetaDictionary",
-                                              metaDictionary_(closure_.records())));
+                                              common_.metaDictionary(closure_.records())));
         root.properties.push_back(
             ReferenceTo(meta::kRootHeader, u"Header", std::move(storedHeader)));
         return root;
@@ -408,9 +406,9 @@ private:
         return out;
     }
 
-    // Of the definitions that every model has from the start only those are
-    // stored that something refers to. A definition may refer to others, so
-    // the sets are gone through until nothing is added.
+    // Of the definitions that every model has from the start all of data are
+    // stored, of others only those that something refers to. A definition may
+    // refer to others, so the sets are gone through until nothing is added.
     StoredObject StoredDictionary(const Dictionary& from) {
         StoredObject out;
         ClassFacts& facts = FactsOfClass(from);
@@ -437,6 +435,7 @@ private:
                 AddDefinitions(set->second, value->objects(), stored);
             }
         } while (stored.size() != before);
+        AddDataDefinitions(from, sets);
         for (auto& set : sets) {
             if (!set.second.objects.empty()) {
                 out.properties.push_back(std::move(set.second));
@@ -467,10 +466,30 @@ private:
         const Path path = {meta::kRootHeader, prop::Header_Dictionary.pid, set.pid};
         for (const RefPtr<Object>& definition : definitions) {
             const Bytes key = definition->UniqueKey();
-            const bool wanted = !IsBuiltInDefinition(key) || targets_[path].count(key) != 0;
+            const bool wanted = !IsBuiltInContainer(key) || targets_[path].count(key) != 0;
             if (wanted && stored.insert(definition.get()).second) {
                 set.keys.push_back(key);
                 set.objects.push_back(StoredObjectOf(*definition));
+            }
+        }
+    }
+
+    // Programs that extend a file look for all of them. Those that nobody looked up say what the
+    // built-in model says.
+    void AddDataDefinitions(const Dictionary& from, std::map<PropertyId, StoredProperty>& sets) {
+        const PropertyKey& key = prop::Dictionary_DataDefinitions;
+        const auto [place, isNew] = sets.try_emplace(key.pid);
+        StoredProperty& set = place->second;
+        if (isNew) {
+            set = EmptyProperty(*from.classDefinition().FindProperty(key.pid));
+        }
+        closure_.AddClass(AUID_AAFDataDefinition);
+        for (const BuiltInDefinition& entry : BuiltInDataDefinitions()) {
+            const StoredAuid id = AuidOf(entry.id);
+            const Bytes bytes(id.begin(), id.end());
+            if (std::find(set.keys.begin(), set.keys.end(), bytes) == set.keys.end()) {
+                set.keys.push_back(bytes);
+                set.objects.push_back(common_.dataDefinition(entry));
             }
         }
     }
@@ -500,7 +519,7 @@ private:
 
     Model& model_;
     MetaClosure closure_;
-    const MetaDictionary metaDictionary_;
+    const Common common_;
     const Object* replaced_ = nullptr;
     const Object* content_ = nullptr;
     std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
@@ -510,11 +529,12 @@ private:
 }  // namespace
 
 StoredObject TreeOfModel(Model& model, Object& header) {
-    return ModelWriter(model, StoredMetaDictionary).Write(header, nullptr);
+    return ModelWriter(model, {StoredMetaDictionary, StoredDataDefinition}).Write(header, nullptr);
 }
 
 StoredObject TreeToWrite(Model& model, Object& header, const Object* content) {
-    return ModelWriter(model, LaidOutMetaDictionary).Write(header, content);
+    return ModelWriter(model, {LaidOutMetaDictionary, LaidOutDataDefinition})
+        .Write(header, content);
 }
 
 }  // namespace aaf::stored

@@ -357,13 +357,39 @@ TEST(ModelFile, EssenceIsKeptAsAStream) {
     }
 }
 
-TEST(ModelFile, OnlyDefinitionsThatAreReferredToOrOwnAreStored) {
+TEST(ModelFile, DefinitionsOfDataAreStoredAndThoseThatAreReferredToOrOwn) {
     const sample::SampleModel sample = sample::WholeModel();
     const StoredObject tree = TreeOfModel(*sample.model, *sample.header);
     const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
-    EXPECT_EQ(dictionary.Find(prop::Dictionary_DataDefinitions.pid)->objects.size(), 3u);
+    EXPECT_EQ(dictionary.Find(prop::Dictionary_DataDefinitions.pid)->objects.size(), 11u);
     EXPECT_EQ(dictionary.Find(prop::Dictionary_ContainerDefinitions.pid)->objects.size(), 2u);
     EXPECT_EQ(dictionary.Find(prop::Dictionary_OperationDefinitions.pid), nullptr);
+}
+
+// Programs that extend a file look for any of them.
+TEST(ModelFile, AllDefinitionsOfDataAreStoredWhetherLookedUpOrNot) {
+    for (const bool isLookedUp : {false, true}) {
+        const sample::SampleModel sample = sample::EmptyModel();
+        if (isLookedUp) {
+            EXPECT_EQ(sample.model->dictionary().CountObjects(prop::Dictionary_DataDefinitions),
+                      11u);
+        }
+        const StoredObject tree = ReadTree(BytesToSave(sample));
+        const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
+        const StoredProperty& set = *dictionary.Find(prop::Dictionary_DataDefinitions.pid);
+        std::size_t at = 0;
+        std::vector<BuiltInDefinition> sorted(BuiltInDataDefinitions().begin(),
+                                              BuiltInDataDefinitions().end());
+        std::sort(sorted.begin(), sorted.end(),
+                  [](const auto& a, const auto& b) { return AuidOf(a.id) < AuidOf(b.id); });
+        ASSERT_EQ(set.objects.size(), sorted.size());
+        for (const BuiltInDefinition& entry : sorted) {
+            EXPECT_EQ(set.objects[at], StoredDataDefinition(entry)) << entry.name;
+            ++at;
+        }
+        EXPECT_EQ(tree, ReadTree(BytesOf(sample)));
+        EXPECT_EQ(StoredClasses(tree).count(L"DataDefinition"), 1u);
+    }
 }
 
 TEST(ModelFile, TheMetaDictionaryHoldsWhatIsUsedAndIsClosed) {
