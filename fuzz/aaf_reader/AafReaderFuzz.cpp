@@ -39,7 +39,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         const aaf::RefPtr<aaf::Model> model = aaf::Model::Create(classes);
         std::vector<std::string> notes;
         const aaf::RefPtr<aaf::Object> header = ReadModel(tree, *model, notes);
-        TreeOfModel(*model, *header);
+        CheckTree(TreeOfModel(*model, *header));
     } catch (const StoredError&) {
         // Refused, as most of what a fuzzer makes should be.
     }

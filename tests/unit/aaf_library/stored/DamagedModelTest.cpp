@@ -424,16 +424,22 @@ TEST(DamagedModel, WithARandomChangeIsReadOrRefusedButNeverHarms) {
     std::mt19937 random(seed);
     const Bytes file = WriteTree(SampleTree(), SectorSize::Bytes512);
     int refused = 0;
+    int odd = 0;
     for (int round = 0; round < 300; ++round) {
         Bytes damaged = file;
         for (int i = 0; i < 8; ++i) {
             damaged[512 + random() % (damaged.size() - 512)] = static_cast<std::uint8_t>(random());
         }
         try {
-            refused += refusal(ReadTree(damaged)).empty() ? 0 : 1;
+            const sample::SampleModel sample = read(ReadTree(damaged));
+            odd += sample.notes.empty() ? 0 : 1;
+            // What was read can be written and read again.
+            read(ReadTree(
+                WriteTree(TreeOfModel(*sample.model, *sample.header), SectorSize::Bytes512)));
         } catch (const StoredError&) {
             ++refused;
         }
     }
     EXPECT_GT(refused, 5);
+    EXPECT_GT(odd, 5);
 }
