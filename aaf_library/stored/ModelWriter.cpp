@@ -90,6 +90,7 @@ private:
         StoredProperty empty;                // of the right form and name, holding nothing yet
         std::set<Bytes>* targets = nullptr;  // weak forms: what references to that set lead to
         bool carriesType = false;
+        bool isSetOfParameters = false;
     };
     // What all objects of a class have in common.
     struct ClassFacts {
@@ -168,6 +169,7 @@ private:
         }
         const TypeKind kind = definition.type()->Resolved().kind();
         made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
+        made.isSetOfParameters = definition.id() == prop::OperationGroup_Parameters.id;
         return made;
     }
 
@@ -270,6 +272,9 @@ private:
                         out.keys.push_back(object.UniqueKey());
                     }
                 }
+                if (facts.isSetOfParameters) {
+                    StoreAsSet(out, prop::Parameter_Definition.pid);
+                }
                 break;
             case StoredForm::WeakReference:
             case StoredForm::WeakVector:
@@ -277,6 +282,22 @@ private:
                 AddTargets(out, facts, value);
                 break;
         }
+    }
+
+    // A vector whose elements have different keys becomes a set; others stay what they are.
+    static void StoreAsSet(StoredProperty& vector, PropertyId keyPid) {
+        std::set<Bytes> keys;
+        for (const StoredObject& object : vector.objects) {
+            const StoredProperty* const key = object.Find(keyPid);
+            if (key == nullptr || key->bytes.size() != kIdSize || !keys.insert(key->bytes).second) {
+                return;
+            }
+        }
+        for (const StoredObject& object : vector.objects) {
+            vector.keys.push_back(object.Find(keyPid)->bytes);
+        }
+        vector.form = StoredForm::StrongSet;
+        vector.keyPid = keyPid;
     }
 
     // A property of the right form and name that holds nothing yet.
@@ -483,6 +504,8 @@ private:
         if (isNew) {
             set = EmptyProperty(*from.classDefinition().FindProperty(key.pid));
         }
+        set.keys.reserve(set.keys.size() + BuiltInDataDefinitions().size());
+        set.objects.reserve(set.objects.size() + BuiltInDataDefinitions().size());
         closure_.AddClass(AUID_AAFDataDefinition);
         for (const BuiltInDefinition& entry : BuiltInDataDefinitions()) {
             const StoredAuid id = AuidOf(entry.id);

@@ -600,6 +600,44 @@ TEST(ModelFile, AVectorTakesASetOfObjects) {
     EXPECT_EQ(TreeOfModel(*read.model, *read.header), original);
 }
 
+TEST(ModelFile, ParametersAreStoredAsASetOfTheirDefinitions) {
+    const auto parametersOf = [](std::vector<GUID> definitions) {
+        const sample::SampleModel sample = sample::WholeModel();
+        const auto make = [&](const GUID& classId) {
+            return sample.model->CreateObject(*sample.model->FindClass(classId));
+        };
+        const RefPtr<Object> group = make(AUID_AAFOperationGroup);
+        for (const GUID& id : definitions) {
+            const RefPtr<Object> parameter = make(AUID_AAFConstantValue);
+            if (!(id == GUID{})) {
+                EXPECT_GE(parameter->PutStruct(prop::Parameter_Definition, id), 0);
+            }
+            EXPECT_GE(group->AppendObject(prop::OperationGroup_Parameters, parameter->Identity()),
+                      0);
+        }
+        Object& slot = sample::slot(sample::mob(*sample.header, 2), 0);
+        EXPECT_GE(slot.PutObject(prop::MobSlot_Segment, group->Identity()), 0);
+        const sample::SampleModel read = reread(BytesOf(sample));
+        EXPECT_EQ(read.notes, std::vector<std::string>());
+        Object* again =
+            sample::slot(sample::mob(*read.header, 2), 0).ObjectAt(prop::MobSlot_Segment);
+        EXPECT_EQ(again->CountObjects(prop::OperationGroup_Parameters), definitions.size());
+        const StoredObject tree = TreeOfModel(*read.model, *read.header);
+        const StoredObject& content = child(child(tree, 2), prop::Header_Content.pid);
+        const StoredObject& stored =
+            child(child(child(content, prop::ContentStorage_Mobs.pid, 2), prop::Mob_Slots.pid),
+                  prop::MobSlot_Segment.pid);
+        return *stored.Find(prop::OperationGroup_Parameters.pid);
+    };
+    const StoredProperty set = parametersOf({sample::kQuadTypeId, sample::kOwnClassId});
+    EXPECT_EQ(set.form, StoredForm::StrongSet);
+    EXPECT_EQ(set.keyPid, prop::Parameter_Definition.pid);
+    EXPECT_EQ(set.keys.size(), 2u);
+    EXPECT_EQ(parametersOf({sample::kQuadTypeId, sample::kQuadTypeId}).form,
+              StoredForm::StrongVector);
+    EXPECT_EQ(parametersOf({sample::kQuadTypeId, GUID{}}).form, StoredForm::StrongVector);
+}
+
 TEST(ModelFile, AFilesOwnNamesOfTypesCount) {
     const sample::SampleModel sample = sample::WholeModel();
     StoredObject tree = TreeOfModel(*sample.model, *sample.header);
