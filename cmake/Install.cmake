@@ -1,7 +1,7 @@
 # `cmake --install` and the Debian package. Program, module and libraries find each other by where they
 # lie, so they stay together in a folder of their own; the command is a link to the program there.
 include(GNUInstallDirs)
-set(home ${CMAKE_INSTALL_LIBDIR}/cliphost)
+set(home ${CMAKE_INSTALL_LIBEXECDIR}/cliphost)
 
 install(TARGETS cliphost RUNTIME DESTINATION ${home})
 install(TARGETS NMAUtilLib20 aaf_library movie_library LIBRARY DESTINATION ${home})
@@ -28,7 +28,7 @@ install(FILES ${help}/cliphost.fish DESTINATION ${CMAKE_INSTALL_DATADIR}/fish/ve
 # For modules and hosts of others.
 set(headers ${CMAKE_INSTALL_INCLUDEDIR}/cliphost)
 install(TARGETS host_interfaces FILE_SET HEADERS DESTINATION ${headers})
-file(WRITE ${PROJECT_BINARY_DIR}/host_interfaces.pc "prefix=${CMAKE_INSTALL_PREFIX}
+file(WRITE ${PROJECT_BINARY_DIR}/host_interfaces.pc "prefix=\${pcfiledir}/../..
 includedir=\${prefix}/${headers}
 
 Name: host_interfaces

@@ -10,6 +10,7 @@
 #include "host_interfaces/Version.h"
 #include "host_interfaces/aaf/AAFResultCodes.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
@@ -71,6 +72,19 @@ private:
     std::vector<std::string> all_;
 };
 
+// Makes a copy that can be written, whatever the permissions of its source.
+void CopyForEdit(const std::filesystem::path& source, OutputFile& output) {
+    std::error_code error;
+    std::filesystem::copy_file(source, output.NameForOther(), error);
+    if (!error) {
+        std::filesystem::permissions(output.NameForOther(), std::filesystem::perms::owner_write,
+                                     std::filesystem::perm_options::add, error);
+    }
+    if (error) {
+        output.Fail(error.value());
+    }
+}
+
 // How files name this program as their writer.
 class ThisProgram {
 public:
@@ -130,7 +144,7 @@ bool AafLibrary::PinTime(const aafTimeStamp_t& time) {
 }
 
 // The library writes files alone, so a device takes the bytes of one.
-void AafLibrary::SaveToDevice(IAAFFile* file, const std::filesystem::path& device) const {
+void AafLibrary::WriteToDevice(const std::filesystem::path& device, const Write& write) const {
     std::error_code error;
     const host::system::ScratchFolder scratch(error);
     if (error) {
@@ -139,41 +153,97 @@ void AafLibrary::SaveToDevice(IAAFFile* file, const std::filesystem::path& devic
                       "name another one in TMPDIR");
     }
     const std::filesystem::path clip = scratch.path() / "clip.aaf";
-    Save(file, clip);
+    write(clip);
     PutIntoPlace(clip, device);
 }
 
+// The steps of the library that write an output.
+class AafLibrary::Steps {
+public:
+    Steps(const AafLibrary& library, OutputFile& output, const std::filesystem::path& path)
+        : library_(library),
+          output_(output),
+          path_(path),
+          said_(library.find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput")) {}
+
+    // Throws a Failure that says why a step failed.
+    void Check(HRESULT result, const char* step) {
+        if (result >= 0) {
+            return;
+        }
+        if (const int error = SystemErrorIn(said_.last())) {
+            output_.Fail(error);
+        }
+        output_.TryPlace();
+        const std::string reason =
+            said_.last().empty() ? library_.TextOfResult(result) : said_.last();
+        throw Failure(
+            kExitCaller, path_,
+            fmt::format(
+                "not written: {} failed: {}", step,
+                reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result)) : reason));
+    }
+
+private:
+    const AafLibrary& library_;
+    OutputFile& output_;
+    const std::filesystem::path& path_;
+    const LibrarySentences said_;
+};
+
 void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
     if (OutputFile::IsDevice(path)) {
-        SaveToDevice(file, path);
+        WriteToDevice(path, [&](const std::filesystem::path& clip) { Save(file, clip); });
         return;
     }
     const auto openNew = find<AAFFileOpenNewModifyExFunction>("AAFFileOpenNewModifyEx");
     ThisProgram program;
     OutputFile output(path, OutputFile::Writer::Other);
-    const LibrarySentences said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
-    const auto check = [&](HRESULT result, const char* step) {
-        if (result >= 0) {
-            return;
-        }
-        if (const int error = SystemErrorIn(said.last())) {
-            output.Fail(error);
-        }
-        output.TryPlace();
-        const std::string reason = said.last().empty() ? TextOfResult(result) : said.last();
-        throw Failure(
-            kExitCaller, path,
-            fmt::format(
-                "not written: {} failed: {}", step,
-                reason.empty() ? fmt::format("0x{:08X}", static_cast<ncfUInt32>(result)) : reason));
-    };
+    Steps steps(*this, output, path);
     host::Ref<IAAFFile> copy;
-    check(openNew(WideName(output.NameForOther()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
-                  program.identification(), copy.Out()),
-          "opening a new file");
+    steps.Check(openNew(WideName(output.NameForOther()).c_str(), &kAAFFileKind_Aaf512Binary, 0,
+                        program.identification(), copy.Out()),
+                "opening a new file");
     // This saves the copy, too.
-    check(file->SaveCopyAs(copy.get()), "copying the description");
-    check(copy->Close(), "closing");
+    steps.Check(file->SaveCopyAs(copy.get()), "copying the description");
+    steps.Check(copy->Close(), "closing");
+    output.Finish();
+}
+
+void AafLibrary::SaveAsItIs(const std::filesystem::path& source,
+                            const std::filesystem::path& path) const {
+    if (OutputFile::IsDevice(path)) {
+        WriteToDevice(path, [&](const std::filesystem::path& clip) { SaveAsItIs(source, clip); });
+        return;
+    }
+    OutputFile output(path, OutputFile::Writer::Other);
+    CopyForEdit(source, output);
+    output.Finish();
+}
+
+void AafLibrary::SaveEdited(const std::filesystem::path& source, const std::filesystem::path& path,
+                            const std::function<void(IAAFFile*)>& edit) const {
+    if (OutputFile::IsDevice(path)) {
+        WriteToDevice(path,
+                      [&](const std::filesystem::path& clip) { SaveEdited(source, clip, edit); });
+        return;
+    }
+    const auto open = find<AAFFileOpenExistingModifyFunction>("AAFFileOpenExistingModify");
+    if (!open) {
+        throw Failure(kExitCaller, file_, "this AAF library edits no files",
+                      "name another with --aaf-library FILE");
+    }
+    ThisProgram program;
+    OutputFile output(path, OutputFile::Writer::Other);
+    CopyForEdit(source, output);
+    Steps steps(*this, output, path);
+    host::Ref<IAAFFile> copy;
+    steps.Check(
+        open(WideName(output.NameForOther()).c_str(), 0, program.identification(), copy.Out()),
+        "opening the copy");
+    edit(copy.get());
+    steps.Check(copy->Save(), "saving");
+    steps.Check(copy->Close(), "closing");
     output.Finish();
 }
 
@@ -195,6 +265,12 @@ host::Ref<IAAFFile> AafLibrary::OpenTransient() const {
 }
 
 host::Ref<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
+    if (Problem problem = WhyUnreadable(path)) {
+        if (std::filesystem::is_directory(path)) {
+            problem.hint = "give an AAF file in it";
+        }
+        throw Failure(problem);
+    }
     const auto openRead = find<AAFFileOpenExistingReadFunction>("AAFFileOpenExistingRead");
     const LibrarySentences said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
     host::Ref<IAAFFile> file;

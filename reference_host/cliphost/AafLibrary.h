@@ -3,6 +3,7 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <optional>
 
 #include "host_interfaces/aaf/AAFExports.h"
@@ -30,11 +31,17 @@ public:
     // replaced once the new one is whole; a device is written. Throws a Failure,
     // or ReaderGone.
     void Save(IAAFFile* file, const std::filesystem::path& path) const;
+    // Saves a file anew with what `edit` changes in it; all else stays as it is in `source`, which
+    // may be the same path. The same Failures, and those of `edit`.
+    void SaveEdited(const std::filesystem::path& source, const std::filesystem::path& path,
+                    const std::function<void(IAAFFile*)>& edit) const;
+    // The bytes of a saved file elsewhere, which may be the same path.
+    void SaveAsItIs(const std::filesystem::path& source, const std::filesystem::path& path) const;
     // Throws that Failure early for a path where nothing can be saved, and leaves nothing there.
     void TryToSave(const std::filesystem::path& path) const;
     // A new file in memory. Throws a Failure.
     host::Ref<IAAFFile> OpenTransient() const;
-    // Opens a saved file for reading. Throws a Failure.
+    // Opens a saved file for reading. Throws a Failure, the caller's for one that can't be reached.
     host::Ref<IAAFFile> Open(const std::filesystem::path& path) const;
 
     // The library's own text for one of its codes, empty when it has none.
@@ -42,7 +49,9 @@ public:
     std::string Version() const;
 
 private:
-    void SaveToDevice(IAAFFile* file, const std::filesystem::path& device) const;
+    using Write = std::function<void(const std::filesystem::path&)>;
+    void WriteToDevice(const std::filesystem::path& device, const Write& write) const;
+    class Steps;
     template <class Function>
     Function find(const char* name) const {
         return reinterpret_cast<Function>(library_.Find(name));

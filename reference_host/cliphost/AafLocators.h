@@ -4,6 +4,7 @@
 
 #include <functional>
 
+#include "host_interfaces/aaf/AAFDescriptors.h"
 #include "host_interfaces/aaf/AAFFile.h"
 #include "host_interfaces/aaf/AAFLocators.h"
 #include "host_interfaces/aaf/AAFMobs.h"
@@ -16,10 +17,14 @@ namespace cliphost {
 using TakeLocator = std::function<void(IAAFMob& mob, IAAFLocator& locator)>;
 void ForEachLocator(IAAFFile* file, const TakeLocator& take);
 void ForEachLocatorOf(IAAFMob& mob, const TakeLocator& take);
+// Calls for the descriptor of a source mob, and for those inside it.
+void ForEachDescriptorOf(IAAFMob& mob,
+                         const std::function<void(IAAFEssenceDescriptor& descriptor)>& take);
 
 // The URL or path that a locator holds; empty where it holds none.
 std::string PathOf(IAAFLocator& locator);
-// Throws a Failure when the library refuses.
+// Throw a Failure when the library refuses.
+void AppendLocator(IAAFFile* file, IAAFEssenceDescriptor& descriptor, const std::string& url);
 void SetPath(IAAFLocator& locator, const std::string& url);
 
 // Writes locators as the other machine sees the media.

@@ -6,26 +6,15 @@
 
 #include <set>
 
-#include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
-#include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMasterMobs.h"
 #include "host_interfaces/aaf/AAFResultCodes.h"
+#include "reference_host/cliphost/AafClips.h"
 #include "reference_host/cliphost/AafLocators.h"
 #include "reference_host/cliphost/AafQuery.h"
 #include "reference_host/cliphost/Failure.h"
 
 namespace cliphost {
-namespace {
-
-std::string KeyOf(IAAFMob& mob) {
-    aafMobID_t id{};
-    mob.GetMobID(&id);
-    return std::string(reinterpret_cast<const char*>(&id), sizeof id);
-}
-
-}  // namespace
-
 std::filesystem::path Bin::Add(IAAFFile* description, const std::filesystem::path& movie) {
     const auto check = [&](HRESULT result, const char* step) {
         if (result < 0) {
@@ -49,7 +38,7 @@ std::filesystem::path Bin::Add(IAAFFile* description, const std::filesystem::pat
         const bool isMaster = As<IAAFMasterMob>(mob.get()).get() != nullptr;
         if (to->LookupMob(id, there.Out()) >= 0) {
             if (isMaster) {
-                same = movies_[KeyOf(*mob)];
+                same = movies_[KeyOf(id)];
             }
             AddLocators(*mob, *there);
             continue;
@@ -57,7 +46,7 @@ std::filesystem::path Bin::Add(IAAFFile* description, const std::filesystem::pat
         check(mob->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, file_.get(), there.Out()),
               "copying a mob");
         if (isMaster) {
-            movies_.emplace(KeyOf(*mob), movie.native());
+            movies_.emplace(KeyOf(id), movie.native());
             clips_.push_back(std::move(there));
         }
     }
@@ -69,19 +58,13 @@ void Bin::AddLocators(IAAFMob& from, IAAFMob& to) {
     ForEachLocatorOf(to, [&](IAAFMob&, IAAFLocator& locator) { known.insert(PathOf(locator)); });
     const auto source = As<IAAFSourceMob>(&to);
     host::Ref<IAAFEssenceDescriptor> descriptor;
-    host::Ref<IAAFDictionary> dictionary;
-    if (!source || source->GetEssenceDescriptor(descriptor.Out()) < 0 ||
-        file_->GetDictionary(dictionary.Out()) < 0) {
+    if (!source || source->GetEssenceDescriptor(descriptor.Out()) < 0) {
         return;
     }
     ForEachLocatorOf(from, [&](IAAFMob&, IAAFLocator& locator) {
         const std::string url = PathOf(locator);
-        host::Ref<IAAFLocator> added;
-        if (known.insert(url).second &&
-            dictionary->CreateInstance(AUID_AAFNetworkLocator, IID_IAAFLocator,
-                                       reinterpret_cast<IUnknown**>(added.Out())) >= 0) {
-            SetPath(*added, url);
-            descriptor->AppendLocator(added.get());
+        if (known.insert(url).second) {
+            AppendLocator(file_.get(), *descriptor, url);
         }
     });
 }

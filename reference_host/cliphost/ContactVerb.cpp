@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <fmt/format.h>
 
+#include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/SheetRun.h"
 #include "reference_host/cliphost/Verbs.h"
@@ -78,17 +79,18 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
         "With --use-alpha transparent parts show a checkerboard.");
     auto options = std::make_shared<SheetsOptions>();
     MoviesOptions& movies = options->movies;
-    verb->add_option("paths", movies.paths, "Movies and folders")->required();
     auto* const output = verb->add_option("-o,--output", movies.file,
                                           "The PNG file of the only movie, or - for standard "
                                           "output");
     verb->add_option("--out-dir", movies.outFolder, "Write every movie's sheet into this folder")
         ->excludes(output);
     AddSheetForm(*verb, options->form);
+    AddInputOptions(*verb, movies, *output);
     AddWorkerOptions(*verb, movies.workers);
     AddContactForParent(app, session, status);
     verb->callback([&app, verb, &session, &status, options] {
         MoviesOptions& asked = options->movies;
+        NeedInputs(asked);
         CheckPlaces(asked);
         options->form.showsProgress = asked.paths.size() == 1 && !asked.file.empty();
         TakeWorkerVerb(app, *verb, "contact-for-parent", session, asked.workers);

@@ -7,7 +7,9 @@
 #include <algorithm>
 #include <nlohmann/json.hpp>
 
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
@@ -78,9 +80,12 @@ void DescribeRun::AddToBin(IAAFFile* description, const std::filesystem::path& m
     }
 }
 
-// Without a clip nothing is saved.
+// Without a clip nothing is saved, nor is a part of the clips.
 void DescribeRun::SaveBin() {
     const std::filesystem::path& file = options_.movies.together;
+    if (IsStopped()) {
+        throw Failure(kExitFile, file, "not written: not all movies were read");
+    }
     if (bin_->clips().empty()) {
         throw Failure(kExitFile, file, "not written: no movie was described");
     }
@@ -91,7 +96,11 @@ void DescribeRun::SaveBin() {
 }
 
 void DescribeRun::AddEntry(const ordered_json& head, const std::string& description) {
-    entries_.push_back(EntryText(head, description));
+    if (options_.form.lines) {
+        PrintJsonLine(EntryText(head, description));
+    } else {
+        entries_.push_back(EntryText(head, description));
+    }
 }
 
 bool DescribeRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
@@ -103,6 +112,14 @@ void DescribeRun::ShowFailure(const std::filesystem::path& movie, const Problem&
         ordered_json head = {{"movie", MachinePath(movie)}};
         AddProblem(problem, head);
         AddEntry(head, "");
+    }
+}
+
+void DescribeRun::ShowDone(const std::filesystem::path& movie, const std::filesystem::path& saved) {
+    if (options_.form.json) {
+        AddEntry(
+            {{"movie", MachinePath(movie)}, {"aaf", MachinePath(saved)}, {"doneAlready", true}},
+            "");
     }
 }
 
@@ -145,25 +162,32 @@ void DescribeRun::Finish(int described, int failed) {
             AddEntry(head, "");
         }
     }
-    for (const std::string& rule : maps_.Unused()) {
-        if (described > 0) {
-            TellAlso(Failure(kExitCaller, "--map " + rule, "nothing was mapped by it",
-                             "give FROM as the locators of `cliphost describe` begin"));
+    // Movies of which nothing is known here may be those that a rule is for.
+    if (doneBefore() == 0 && !IsStopped() && options_.movies.shard.IsWhole() && described > 0) {
+        for (const Failure& unused :
+             UnusedMaps(maps_, "give FROM as the locators of `cliphost describe` begin")) {
+            TellAlso(unused);
         }
     }
     if (!options_.form.json) {
-        const bool isTaken = host::system::IsStandardOutput(options_.movies.file) ||
-                             host::system::IsStandardOutput(options_.movies.together);
-        if (described + failed != 1 && !isTaken) {
-            fmt::print("{} described, {} not\n", described, failed);
+        PrintSummary(described, failed);
+    } else if (!options_.form.lines) {
+        fmt::print("[");
+        for (std::size_t i = 0; i < entries_.size(); ++i) {
+            fmt::print("{}\n{}", i == 0 ? "" : ",", entries_[i]);
         }
-        return;
+        fmt::print("{}]\n", entries_.empty() ? "" : "\n");
     }
-    fmt::print("[");
-    for (std::size_t i = 0; i < entries_.size(); ++i) {
-        fmt::print("{}\n{}", i == 0 ? "" : ",", entries_[i]);
+}
+
+void DescribeRun::PrintSummary(int described, int failed) const {
+    const bool isTaken = host::system::IsStandardOutput(options_.movies.file) ||
+                         host::system::IsStandardOutput(options_.movies.together);
+    if (doneBefore() > 0) {
+        fmt::print("{} described, {} not, {} done already\n", described, failed, doneBefore());
+    } else if (described + failed != 1 && !isTaken) {
+        fmt::print("{} described, {} not\n", described, failed);
     }
-    fmt::print("{}]\n", entries_.empty() ? "" : "\n");
 }
 
 }  // namespace cliphost

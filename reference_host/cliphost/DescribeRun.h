@@ -28,17 +28,19 @@ private:
     void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
               const std::filesystem::path& saved) override;
     void ShowFailure(const std::filesystem::path& movie, const Problem& problem) override;
+    void ShowDone(const std::filesystem::path& movie, const std::filesystem::path& saved) override;
     void Collect(const std::filesystem::path& movie, const std::filesystem::path& file) override;
     void Finish(int described, int failed) override;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
     void SaveBin();
+    void PrintSummary(int described, int failed) const;
     void AddEntry(const nlohmann::ordered_json& head, const std::string& description);
 
     const DescribeOptions& options_;
     PathMaps maps_;  // to know which were used
     std::optional<Bin> bin_;
     std::filesystem::path copyOf_;      // what the last movie that went into the bin is a copy of
-    std::vector<std::string> entries_;  // of the JSON list
+    std::vector<std::string> entries_;  // of the JSON list that comes at the end
 };
 
 }  // namespace cliphost

@@ -2,8 +2,10 @@
 // SPDX-License-Identifier: MIT
 
 #include "reference_host/cliphost/DescribeRun.h"
+#include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
@@ -14,24 +16,19 @@ namespace {
 
 // What both processes are told of a description.
 void AddForm(CLI::App& verb, DescriptionForm& form, std::string& pinned) {
-    verb.add_flag("--json", form.json, kJsonHelp);
+    auto* const json = verb.add_flag("--json", form.json, kJsonHelp);
+    verb.add_flag("--jsonl", form.lines,
+                  "As JSON, a line for each movie as soon as it is done, with the members of an "
+                  "entry of --json")
+        ->excludes(json);
     verb.add_flag("-q,--quiet", form.quiet, "Only a line for each movie");
     verb.add_option("--pin-time", pinned,
                     "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
                     "same movie gives the same bytes");
-    verb.add_option_function<std::vector<std::string>>(
-            "--map",
-            [&form](const std::vector<std::string>& rules) {
-                for (const std::string& rule : rules) {
-                    form.maps.Add(rule);
-                }
-            },
-            "FROM=TO, for another machine that reads what is saved: locators of movies in the "
-            "folder "
-            "FROM name TO instead, which is a folder, a drive (M:) or a share (//server/share); "
-            "may "
-            "be given several times, and the longest FROM counts")
-        ->allow_extra_args(false);
+    AddMapOption(verb, form.maps,
+                 "FROM=TO, for another machine that reads what is saved: locators of movies in the "
+                 "folder FROM name TO instead, which is a folder, a drive (M:) or a share "
+                 "(//server/share); may be given several times, and the longest FROM counts");
 }
 
 SessionOptions WithTime(const SessionOptions& session, const std::string& pinned) {
@@ -47,6 +44,7 @@ void AddDescribeForParent(CLI::App& app, const SessionOptions& session, int& sta
     CLI::App* const verb = AddWorkerVerb(app, worker);
     AddForm(*verb, *form, *pinned);
     verb->callback([&session, &status, worker, form, pinned] {
+        form->json = form->json || form->lines;
         Session running(WithTime(session, *pinned));
         ServeMovies(running, *worker,
                     [&](const std::filesystem::path& movie, const PlaceOfFile& place) {
@@ -64,7 +62,6 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     verb->footer("Example: cliphost describe clip.mov --aaf clip.aaf");
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
-    verb->add_option("paths", options->movies.paths, "Movies and folders")->required();
     auto* const aaf =
         verb->add_option("--aaf", options->movies.file,
                          "Save the file of the only movie here; - for standard output");
@@ -82,10 +79,13 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                    "programs that show sequences alone")
         ->needs(bin);
     AddForm(*verb, options->form, *pinned);
+    AddInputOptions(*verb, options->movies, *aaf);
     AddWorkerOptions(*verb, options->movies.workers);
     AddDescribeForParent(app, session, status);
     verb->callback([&app, verb, &session, &status, options, pinned] {
-        AnswerFailureToo(options->form.json, nlohmann::ordered_json::array(), [&] {
+        NeedInputs(options->movies);
+        options->form.json = options->form.json || options->form.lines;
+        const auto work = [&] {
             if (!options->movies.file.empty() &&
                 (options->movies.paths.size() != 1 ||
                  std::filesystem::is_directory(options->movies.paths[0]))) {
@@ -104,7 +104,12 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));
             status = DescribeRun(running, *options).Run();
-        });
+        };
+        if (options->form.lines) {
+            AnswerFailureInLine(work);
+        } else {
+            AnswerFailureToo(options->form.json, nlohmann::ordered_json::array(), work);
+        }
     });
 }
 

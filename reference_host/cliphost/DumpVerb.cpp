@@ -4,7 +4,6 @@
 #include <fmt/format.h>
 
 #include "reference_host/cliphost/AafTree.h"
-#include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/JsonText.h"
 #include "reference_host/cliphost/MachinePath.h"
@@ -35,12 +34,6 @@ void AddDump(CLI::App& app, const SessionOptions& options) {
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, file, json] {
         AnswerFailureToo(*json, {{"aaf", MachinePath(*file)}}, [&] {
-            if (Problem problem = WhyUnreadable(*file)) {
-                if (std::filesystem::is_directory(*file)) {
-                    problem.hint = "give an AAF file in it";
-                }
-                throw Failure(problem);
-            }
             const std::unique_ptr<AafLibrary> library = LoadAafLibrary(options);
             const TreeNode tree = ReadTree(library->Open(*file).get());
             if (*json) {

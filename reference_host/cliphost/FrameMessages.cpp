@@ -44,7 +44,9 @@ std::string FrameRequest::ToBytes() const {
         .Add(range.end.value_or(kNoEnd))
         .Add(range.step)
         .Add(std::uint64_t{wanted.isOne})
+        .Add(std::uint64_t{wanted.areBelieved})
         .Add(std::uint64_t{jobs})
+        .Add(behind)
         .bytes();
 }
 
@@ -57,14 +59,21 @@ FrameRequest FrameRequest::From(std::string_view bytes) {
     range.end = fields.Number();
     range.step = fields.Number();
     request.wanted.isOne = fields.Number() != 0;
+    request.wanted.areBelieved = fields.Number() != 0;
     request.jobs = static_cast<unsigned>(fields.Number());
+    request.behind = fields.Number();
     return request;
 }
 
 std::string FrameAnswer::ToBytes() const {
     FieldWriter fields;
-    fields.Add(cliphost::ToBytes(outcome)).Add(plan.count).Add(plan.rawWords).Add(written);
-    fields.Add(Size(width)).Add(Size(height)).Add(std::uint64_t{plan.cuts.size()});
+    fields.Add(cliphost::ToBytes(outcome))
+        .Add(plan.count)
+        .Add(plan.frameBytes)
+        .Add(plan.rawWords)
+        .Add(written);
+    fields.Add(Size(width)).Add(Size(height)).Add(std::uint64_t{plan.isInOneGo});
+    fields.Add(std::uint64_t{plan.cuts.size()});
     for (const std::uint64_t cut : plan.cuts) {
         fields.Add(cut);
     }
@@ -76,10 +85,12 @@ bool FrameAnswer::Read(std::string_view bytes, const FrameRequest& request) {
     FieldReader fields(bytes);
     const bool isOutcome = FromBytes(fields.Text(), {}, outcome);
     plan.count = fields.Number();
+    plan.frameBytes = fields.Number();
     plan.rawWords = fields.Text();
     written = fields.Text();
     width = static_cast<int>(fields.Number());
     height = static_cast<int>(fields.Number());
+    plan.isInOneGo = fields.Number() != 0;
     const std::uint64_t cuts = fields.Number();
     if (cuts > bytes.size() / kLengthSize) {
         return false;

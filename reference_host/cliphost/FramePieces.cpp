@@ -4,12 +4,14 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <map>
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FrameMessages.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/PrivateFile.h"
+#include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
@@ -17,11 +19,10 @@ namespace {
 
 using Kind = FrameRequest::Kind;
 
-// Behind what a process tells when it opens the movie, which the plan's process has told already.
+// Before what a process tells of the frames of a piece, and behind what it tells when it opens the
+// movie, which the plan's process has told already.
 // A movie's texts are printed without such characters.
 constexpr char kEndOfOpening = '\x01';
-// A piece that takes long lets no more than these wait on the disk, for each process.
-constexpr std::size_t kMostWaiting = 4;
 
 // The file of one frame, in the folder that is the child's own.
 std::filesystem::path FrameFile(const std::filesystem::path& folder, std::uint64_t number,
@@ -49,7 +50,20 @@ public:
     }
 
     FramePlan Run() {
-        RunInWorkers(options_.workers, {request_.ToBytes()}, *this);
+        Ask();
+        // Frames are counted by reading the last one. What that does to the process is to cost the
+        // piece that has it, not all.
+        if (!result_.failure.empty() && !request_.wanted.isOne) {
+            request_.wanted.areBelieved = true;
+            Ask();
+        }
+        Notice("{}", result_.told);
+        if (!result_.failure.empty()) {
+            throw Failure(kExitFile, options_.movie, result_.failure);
+        }
+        if (answer_.outcome.status != kExitFine) {
+            throw Failure(answer_.outcome.status, answer_.outcome.problem);
+        }
         return std::move(answer_.plan);
     }
 
@@ -57,19 +71,13 @@ private:
     bool Read(std::size_t, const std::string& answer) override {
         return answer_.Read(answer, request_);
     }
-    void Take(std::size_t, const WorkerResult& result) override {
-        Notice("{}", result.told);
-        if (!result.failure.empty()) {
-            throw Failure(kExitFile, options_.movie, result.failure);
-        }
-        if (answer_.outcome.status != kExitFine) {
-            throw Failure(answer_.outcome.status, answer_.outcome.problem);
-        }
-    }
+    void Take(std::size_t, const WorkerResult& result) override { result_ = result; }
+    void Ask() { RunInWorkers(options_.workers, {request_.ToBytes()}, *this); }
 
     const FrameOptions& options_;
     FrameRequest request_;
     FrameAnswer answer_;
+    WorkerResult result_;
 };
 
 class RunInPieces final : public FrameRun, private WorkerClient {
@@ -84,26 +92,36 @@ private:
         return answers_[number].Read(answer, requests_[number]);
     }
     void Take(std::size_t number, const WorkerResult& result) override;
+    MadeFrame Made(std::size_t number, const std::filesystem::path& folder, std::size_t i) const;
+    Problem WhyLost(std::size_t number, const WorkerResult& result) const;
     void TakeFrames(std::size_t number, const std::filesystem::path& folder);
     std::filesystem::path FolderNearOutput() const;
+    Problem NotWrittenIn(const std::filesystem::path& folder, std::uint64_t frame,
+                         Problem problem) const;
 
+    std::uint64_t frameBytes_ = 0;
     std::vector<FrameRequest> requests_;
     std::map<std::size_t, FrameAnswer> answers_;  // that were read and not yet taken
 };
 
 void RunInPieces::WriteAll(const FramePlan& plan) {
+    frameBytes_ = plan.frameBytes;
+    std::uint64_t longest = 1;
     std::vector<std::string> messages;
     for (std::size_t i = 0; i <= plan.cuts.size(); ++i) {
         const std::uint64_t begin = i == 0 ? 0 : plan.cuts[i - 1];
         const std::uint64_t end = i == plan.cuts.size() ? plan.count : plan.cuts[i];
-        FrameRequest piece{sink().IsRaw() ? Kind::Raw : Kind::Pictures, {}, 1};
+        FrameRequest piece{sink().IsRaw() ? Kind::Raw : Kind::Pictures, {}, 1, 0};
         piece.wanted.range = {NumberOf(begin), NumberOf(end - 1) + 1, wanted().range.step};
+        piece.behind = NumberOf(plan.isInOneGo ? 0 : begin);
+        longest = std::max(longest, end - begin);
         requests_.push_back(piece);
         messages.push_back(piece.ToBytes());
     }
     WorkerCall call = options().workers;
     call.writeNear = FolderNearOutput();
-    call.mostWaiting = kMostWaiting * call.jobs;
+    call.jobs = plan.isInOneGo ? 1 : call.jobs;
+    call.mostWaiting = MostPiecesWaiting(longest, plan.frameBytes, call.jobs);
     RunInWorkers(call, messages, *this);
 }
 
@@ -118,39 +136,85 @@ std::filesystem::path RunInPieces::FolderNearOutput() const {
 }
 
 void RunInPieces::Take(std::size_t number, const WorkerResult& result) {
-    const std::size_t opening = result.told.find(kEndOfOpening);
-    Notice("{}", result.told.substr(opening == std::string::npos ? 0 : opening + 1));
+    // A process that ended before has told nothing new.
+    if (const std::size_t opening = result.told.find(kEndOfOpening); opening != std::string::npos) {
+        Notice("{}", result.told.substr(opening + 1));
+    }
     const FrameRange& range = requests_[number].wanted.range;
-    if (result.failure.empty()) {
-        TakeFrames(number, result.folder);
-    } else {
+    if (Problem why = WhyLost(number, result)) {
         Count(0, range.CountIn(*range.end));
-        TellProblem(
-            {options().movie, fmt::format("{} left out: {}", FramesInWords(range), result.failure)},
-            options().workers.verbosity);
+        why.subject = options().movie;
+        why.reason = fmt::format("{} left out: {}", FramesInWords(range), why.reason);
+        TellProblem(why, options().workers.verbosity);
+        RemovePrivateFiles(result.folder, number);
+    } else {
+        TakeFrames(number, result.folder);
     }
     answers_.erase(number);
 }
 
-void RunInPieces::TakeFrames(std::size_t number, const std::filesystem::path& folder) {
+// Frames of a piece are counted from 0.
+MadeFrame RunInPieces::Made(std::size_t number, const std::filesystem::path& folder,
+                            std::size_t i) const {
+    const FrameAnswer& answer = answers_.at(number);
     const FrameRange& range = requests_[number].wanted.range;
-    const FrameAnswer& answer = answers_[number];
-    std::uint64_t frame = range.first;
-    for (const char made : answer.written) {
-        Step(frame);
-        if (made == kWritten) {
-            sink().TakeMade({frame, FrameFile(folder, number, frame), answer.width, answer.height});
+    const std::uint64_t frame = range.first + i * range.step;
+    return {frame, FrameFile(folder, number, frame), answer.width, answer.height, frameBytes_};
+}
+
+// A file that can't be written ends the run, as in one process.
+Problem RunInPieces::WhyLost(std::size_t number, const WorkerResult& result) const {
+    if (!result.failure.empty()) {
+        return {options().movie, result.failure};
+    }
+    const FrameAnswer& answer = answers_.at(number);
+    const std::optional<std::uint64_t> bytes =
+        requests_[number].kind == Kind::Raw ? std::optional(frameBytes_) : std::nullopt;
+    for (std::size_t i = 0; i < answer.written.size(); ++i) {
+        const MadeFrame made = Made(number, result.folder, i);
+        if (answer.written[i] == kWritten && !IsOwnFile(made.file, bytes)) {
+            return {
+                options().movie,
+                fmt::format("the process that read it left no whole file of frame {}", made.frame)};
         }
-        Count(made == kWritten ? 1 : 0, made == kWritten ? 0 : 1);
-        frame += range.step;
+    }
+    const bool isWritten =
+        answer.outcome.status == kExitFine ||
+        answer.outcome.problem.subject == Made(number, result.folder, answer.written.size()).file;
+    return isWritten ? Problem() : answer.outcome.problem;
+}
+
+void RunInPieces::TakeFrames(std::size_t number, const std::filesystem::path& folder) {
+    const FrameAnswer& answer = answers_[number];
+    for (std::size_t i = 0; i < answer.written.size(); ++i) {
+        if (host::system::DelayedSignals::HaveCome()) {
+            return;
+        }
+        const MadeFrame made = Made(number, folder, i);
+        Step(made.frame);
+        const bool isWritten = answer.written[i] == kWritten;
+        if (isWritten) {
+            sink().TakeMade(made);
+        }
+        Count(isWritten ? 1 : 0, isWritten ? 0 : 1);
     }
     if (answer.outcome.status != kExitFine) {
-        Problem problem = answer.outcome.problem;
-        if (problem.subject == FrameFile(folder, number, frame)) {
-            problem.subject = sink().PlaceOf(frame);
-        }
-        throw Failure(answer.outcome.status, problem);
+        const std::uint64_t frame = Made(number, folder, answer.written.size()).frame;
+        throw Failure(answer.outcome.status, NotWrittenIn(folder, frame, answer.outcome.problem));
     }
+}
+
+// Files that wait beside the output need the same disk as the output.
+Problem RunInPieces::NotWrittenIn(const std::filesystem::path& folder, std::uint64_t frame,
+                                  Problem problem) const {
+    const std::filesystem::path parent = folder.parent_path().parent_path();
+    if (!OutputFile::IsDevice(options().output) && parent == FolderNearOutput()) {
+        problem.subject = sink().PlaceOf(frame);
+    } else {
+        problem.subject = parent;
+        problem.hint = "name another folder in TMPDIR";
+    }
+    return problem;
 }
 
 // What the child has opened, and keeps for the pieces to come.
@@ -168,8 +232,7 @@ public:
             }
             if (request.kind == Kind::Plan) {
                 answer.plan = source_->Plan(request.wanted);
-                answer.plan.cuts =
-                    source_->Cuts(request.wanted.range, answer.plan.count, request.jobs);
+                source_->Cut(answer.plan, request.wanted.range, request.jobs);
             } else {
                 WritePiece(number, request, answer);
             }
@@ -184,10 +247,15 @@ private:
         const bool isRaw = request.kind == Kind::Raw;
         if (!turn_) {
             turn_ = isRaw ? PictureTurn() : form_.turn.TurnFor(movie_);
-            std::fputc(kEndOfOpening, stderr);
+        }
+        std::fputc(kEndOfOpening, stderr);
+        for (std::uint64_t before = request.behind; before < range.first && next_ != range.first;
+             before += range.step) {
+            source_->Pass(before);
         }
         for (std::uint64_t i = 0, count = range.CountIn(*range.end); i < count; ++i) {
             const std::uint64_t frame = range.first + i * range.step;
+            next_ = frame + range.step;
             const bool isRead = source_->Read(frame);
             if (isRead) {
                 const MadeFrame made =
@@ -206,6 +274,7 @@ private:
     const FrameForm& form_;
     std::optional<FrameSource> source_;
     std::optional<PictureTurn> turn_;
+    std::uint64_t next_ = 0;  // behind the frame read last
 };
 
 }  // namespace

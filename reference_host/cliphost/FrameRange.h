@@ -20,11 +20,11 @@ struct FrameRange {
     std::uint64_t CountIn(std::uint64_t frames) const;
 };
 
-// "A:B" or "A:B:STEP"; A and B may be left out. Throws a Failure that shows how
-// to write it.
 // The range that holds this frame alone.
 FrameRange OneFrame(std::uint64_t frame);
 
+// "A:B" or "A:B:STEP"; A and B may be left out. Throws a Failure that shows how
+// to write it.
 FrameRange ParseFrameRange(const std::string& text);
 
 // A number of frames spread evenly over a clip: the middle one of each equal part.

@@ -43,8 +43,17 @@ FrameReader::FrameReader(Essence& essence, const ClipTrack& track, const std::st
     width_ = static_cast<int>(width);
     height_ = lineBytes == 0 ? 0 : static_cast<int>(size / lineBytes);
     frameBytes_ = size;
+    Start();
+}
+
+void FrameReader::Start() {
     essence_.CheckSamples(essence_.provider().Setup(track_.number), track_,
                           "the reader does not start");
+}
+
+void FrameReader::StartAnew() {
+    essence_.provider().Cleanup(track_.number);
+    Start();
 }
 
 FrameReader::~FrameReader() {

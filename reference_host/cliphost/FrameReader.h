@@ -38,6 +38,8 @@ public:
     std::uint64_t Count();
     std::uint64_t MostFrames() const { return cliphost::MostFrames(essence_, track_); }
 
+    // Forgets what was decoded: what is read next does not lean on it.
+    void StartAnew();
     // NMA_E_NODATA past the last picture, another failure for one that does not
     // decode.
     NCFRESULT Read(std::uint64_t frame);
@@ -47,6 +49,7 @@ public:
 
 private:
     void Choose(const std::string& formatName);
+    void Start();
 
     Essence& essence_;
     const ClipTrack track_;

@@ -40,7 +40,7 @@ protected:
     std::uint64_t NumberOf(std::uint64_t i) const {
         return wanted_.range.first + i * wanted_.range.step;
     }
-    FrameSink& sink() { return *sink_; }
+    FrameSink& sink() const { return *sink_; }
     void Step(std::uint64_t frame);
     void Count(std::uint64_t written, std::uint64_t failed);
 

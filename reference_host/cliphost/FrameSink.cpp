@@ -51,7 +51,7 @@ public:
         ++frames_;
     }
     void TakeMade(const MadeFrame& made) override {
-        AppendTo(output_, made.file, file_);
+        AppendTo(output_, made.file, made.bytes, file_);
         ++frames_;
     }
     std::filesystem::path PlaceOf(std::uint64_t) const override { return file_; }
@@ -138,14 +138,15 @@ MadeFrame WriteFrameFile(const std::filesystem::path& file, std::uint64_t frame,
         OutputFile output(file);
         WriteRaw(output, reader);
         output.Finish();
-        return {frame, file, reader.width(), reader.height()};
+        return {frame, file, reader.width(), reader.height(), reader.frameBytes()};
     }
     const Picture picture = WritePng(file, reader, alpha, turn);
-    return {frame, file, picture.width, picture.height};
+    return {frame, file, picture.width, picture.height, 0};
 }
 
 bool IsRawFile(const std::filesystem::path& output) {
-    return output.extension() == ".raw";
+    std::error_code ignored;
+    return output.extension() == ".raw" && !std::filesystem::is_directory(output, ignored);
 }
 
 std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,

@@ -18,6 +18,7 @@ struct MadeFrame {
     std::filesystem::path file;  // gone once it is taken
     int width = 0;
     int height = 0;
+    std::uint64_t bytes = 0;  // of a raw frame
 };
 
 // Writes a frame as a file: a turned PNG picture, or the bytes as they are delivered. Gives its
@@ -41,7 +42,7 @@ public:
     virtual bool IsRaw() const = 0;
 };
 
-// Whether a path names a file for raw frames.
+// Whether a path names a file for raw frames, and no folder.
 bool IsRawFile(const std::filesystem::path& output);
 
 // The sink that a path asks for: "-", devices and FILE.raw take the bytes as they

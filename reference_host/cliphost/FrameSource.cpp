@@ -10,6 +10,7 @@
 #include "reference_host/cliphost/FrameSink.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/quicktime/CodedAlone.h"
 
 namespace cliphost {
 namespace {
@@ -22,7 +23,16 @@ constexpr std::uint64_t kMostBytes = 256 * kMebibytes;
 // Of a piece that finds no frame to end before.
 constexpr std::uint64_t kMostBytesUncut = 1024 * kMebibytes;
 
+// Of pieces that wait; no process is kept waiting for that.
+constexpr std::uint64_t kMostWaitingForEach = 4;
+constexpr std::uint64_t kMostBytesWaiting = 2048 * kMebibytes;
+// So many pieces at most, whatever a header claims, and so many frames are looked at for each end.
+constexpr std::uint64_t kMostCuts = 4096;
+constexpr std::uint64_t kMostLookedAt = 4096;
+
 constexpr ncfUInt64 kStandsAlone = 1024;
+// In a movie that has other samples, one is among so many.
+constexpr std::uint64_t kSamplesThatTell = 65536;
 
 }  // namespace
 
@@ -58,7 +68,10 @@ FrameSource::FrameSource(Session& session, const std::filesystem::path& movie,
 
 FramePlan FrameSource::Plan(const WantedFrames& wanted) {
     const std::uint64_t count = wanted.range.CountIn(CountTo(wanted));
-    return {count, RawWords(*reader_, track_), {}};
+    if (!wanted.isOne) {
+        reader_->StartAnew();
+    }
+    return {count, reader_->frameBytes(), RawWords(*reader_, track_), {}, false};
 }
 
 std::uint64_t FrameSource::CountTo(const WantedFrames& wanted) {
@@ -66,7 +79,9 @@ std::uint64_t FrameSource::CountTo(const WantedFrames& wanted) {
     // One frame need not be counted: it is there or it is not.
     const bool isThere = wanted.isOne && range.first < reader_->MostFrames() &&
                          reader_->Read(range.first) != NMA_E_NODATA;
-    const std::uint64_t count = isThere ? range.first + 1 : reader_->Count();
+    const std::uint64_t count = isThere              ? range.first + 1
+                                : wanted.areBelieved ? reader_->MostFrames()
+                                                     : reader_->Count();
     if (count == 0) {
         throw Failure(kExitFile, essence_.WhyUnread(track_, range.first, NMA_E_NODATA));
     }
@@ -78,30 +93,42 @@ std::uint64_t FrameSource::CountTo(const WantedFrames& wanted) {
     return count;
 }
 
-std::vector<std::uint64_t> FrameSource::Cuts(const FrameRange& range, std::uint64_t count,
-                                             unsigned jobs) {
-    const std::uint64_t bytes = std::max<std::uint64_t>(reader_->frameBytes(), 1);
+PieceLength PieceLengthFor(std::uint64_t count, std::uint64_t frameBytes, unsigned jobs) {
+    const std::uint64_t bytes = std::max<std::uint64_t>(frameBytes, 1);
     const std::uint64_t least = std::max(kLeastFrames, kLeastBytes / bytes);
     const std::uint64_t even = count / (jobs * kPiecesForEach) + 1;
-    const std::uint64_t length =
-        std::max<std::uint64_t>(1, std::min(std::max(even, least), kMostBytes / bytes));
+    PieceLength length;
+    length.usual =
+        std::max(count / kMostCuts + 1, std::min(std::max(even, least), kMostBytes / bytes));
     // The frames before such a piece are decoded for it, back to one that stands alone.
-    const std::uint64_t longest =
-        std::max(length, std::min(count / jobs + 1, kMostBytesUncut / bytes));
-    std::vector<std::uint64_t> cuts;
-    for (std::uint64_t begin = 0; count - begin > length + length / 2;) {
-        const std::uint64_t last = std::min(begin + longest, count);
-        std::uint64_t cut = begin + length;
+    length.most = std::max(length.usual, std::min({count / jobs + 1, kMostBytesUncut / bytes,
+                                                   length.usual + kMostLookedAt}));
+    return length;
+}
+
+std::size_t MostPiecesWaiting(std::uint64_t frames, std::uint64_t frameBytes, unsigned jobs) {
+    const std::uint64_t bytes = std::max<std::uint64_t>(frameBytes, 1);
+    const std::uint64_t room = kMostBytesWaiting / bytes / std::max<std::uint64_t>(frames, 1);
+    const std::uint64_t least = jobs;
+    return static_cast<std::size_t>(std::clamp(room, least, kMostWaitingForEach * least));
+}
+
+void FrameSource::Cut(FramePlan& plan, const FrameRange& range, unsigned jobs) {
+    const std::uint64_t count = plan.count;
+    const PieceLength length = PieceLengthFor(count, reader_->frameBytes(), jobs);
+    for (std::uint64_t begin = 0; count - begin > length.usual + length.usual / 2;) {
+        const std::uint64_t last = std::min(begin + length.most, count);
+        std::uint64_t cut = begin + length.usual;
         while (cut < last && !StandsAlone(range.first + cut * range.step)) {
             ++cut;
         }
         if (cut == count) {
             break;
         }
-        cuts.push_back(cut);
+        plan.cuts.push_back(cut);
         begin = cut;
     }
-    return cuts;
+    plan.isInOneGo = !plan.cuts.empty() && !TellsWhatStandsAlone();
 }
 
 // By the order of decoding, which differs little from that of the frames.
@@ -112,11 +139,32 @@ bool FrameSource::StandsAlone(std::uint64_t frame) {
     return properties == kStandsAlone;
 }
 
-bool FrameSource::Read(std::uint64_t frame) {
-    NCFRESULT result = reader_->Read(frame);
-    if (result == NCF_OK && alpha_) {
-        result = alpha_->Read(frame);
+// Movies that don't list their sync samples claim that all are. Whose codec has other pictures,
+// too, may be wrong.
+bool FrameSource::TellsWhatStandsAlone() {
+    ncfUInt64 samples = 0;
+    essence_.map().GetNumberOfSamples(track_.number, &samples);
+    samples = std::min<ncfUInt64>(samples, kSamplesThatTell);
+    for (ncfUInt64 i = 0; i < samples; ++i) {
+        if (!StandsAlone(i)) {
+            return true;
+        }
     }
+    return host::AreCodedAlone(essence_.movie());
+}
+
+NCFRESULT FrameSource::ReadBoth(std::uint64_t frame) {
+    const NCFRESULT result = reader_->Read(frame);
+    return result == NCF_OK && alpha_ ? alpha_->Read(frame) : result;
+}
+
+void FrameSource::Pass(std::uint64_t frame) {
+    ReadBoth(frame);
+    essence_.session().TakeNotices();
+}
+
+bool FrameSource::Read(std::uint64_t frame) {
+    const NCFRESULT result = ReadBoth(frame);
     if (result != NCF_OK) {
         essence_.session().TakeNotices();
         Problem problem = essence_.WhyUnread(track_, frame, result);

@@ -31,14 +31,29 @@ struct FrameForm {
 struct WantedFrames {
     FrameRange range;
     bool isOne = false;  // it names a frame, not a range
+    // There are as many as the track's length says: none is read to count them.
+    bool areBelieved = false;
 };
 
 // What is known of them once the movie is open.
 struct FramePlan {
     std::uint64_t count = 0;
+    std::uint64_t frameBytes = 0;     // as they are delivered
     std::string rawWords;             // as RawWords
     std::vector<std::uint64_t> cuts;  // where further pieces of the range begin, counted in frames
+    // Nothing tells which frames stand alone: each piece is read behind those before it.
+    bool isInOneGo = false;
 };
+
+// How many frames a piece of a range has, and how many at most where no frame to end before is
+// found sooner.
+struct PieceLength {
+    std::uint64_t usual = 1;
+    std::uint64_t most = 1;
+};
+PieceLength PieceLengthFor(std::uint64_t count, std::uint64_t frameBytes, unsigned jobs);
+// How many pieces of so many frames may be begun or wait on a disk behind one that takes long.
+std::size_t MostPiecesWaiting(std::uint64_t frames, std::uint64_t frameBytes, unsigned jobs);
 
 // A movie whose frames are read one after the other; those of its alpha track, too, where they
 // are wanted. Throws a Failure.
@@ -48,12 +63,14 @@ public:
 
     // Throws a Failure when there is none of the frames. The plan is for one process.
     FramePlan Plan(const WantedFrames& wanted);
-    // Where pieces begin that keep `jobs` processes at work: each is long enough to be worth a
-    // request, short enough to lie ready on a disk, and begins with a frame that stands alone
+    // Adds where pieces begin that keep `jobs` processes at work: each is long enough to be worth
+    // a request, short enough to lie ready on a disk, and begins with a frame that stands alone
     // where one is near.
-    std::vector<std::uint64_t> Cuts(const FrameRange& range, std::uint64_t count, unsigned jobs);
+    void Cut(FramePlan& plan, const FrameRange& range, unsigned jobs);
     // Tells why a frame can't be read.
     bool Read(std::uint64_t frame);
+    // Reads it for those behind it.
+    void Pass(std::uint64_t frame);
 
     // Of the frame read last.
     const FrameReader& reader() const { return *reader_; }
@@ -62,6 +79,8 @@ public:
 private:
     std::uint64_t CountTo(const WantedFrames& wanted);
     bool StandsAlone(std::uint64_t frame);
+    bool TellsWhatStandsAlone();
+    NCFRESULT ReadBoth(std::uint64_t frame);
 
     Essence essence_;
     const ClipTrack track_;

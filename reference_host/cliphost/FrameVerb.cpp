@@ -72,6 +72,9 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
             status = WriteFramesHere(session, *options, wanted);
             return;
         }
+        RefuseDescriptor(options->workers, options->movie);
+        // What is wrong with the module is told as by one process.
+        const Session tried(options->form.Of(session));
         TakeWorkerVerb(app, *verb, "frame-for-parent", session, options->workers);
         options->workers.arguments.push_back("--of-movie=" + options->movie.native());
         status = WriteFramesInPieces(*options, wanted);

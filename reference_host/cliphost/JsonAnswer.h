@@ -11,6 +11,9 @@ namespace cliphost {
 // Prints what a verb answers to --json on standard output.
 void PrintJson(const nlohmann::ordered_json& answer);
 
+// Prints JSON in one line, at once.
+void PrintJsonLine(std::string_view json);
+
 // Does a verb's work. With `json`, its failure is also written to standard output:
 // `head`, which may name the movie or folder, and the problem. A verb that answers
 // with a list passes an empty one as `head`, to which the problem is added.
@@ -23,6 +26,19 @@ void AnswerFailureToo(bool json, nlohmann::ordered_json head, const Work& work) 
             AddProblem(failure.problem(), head.is_array() ? head.emplace_back() : head);
             PrintJson(head);
         }
+        throw;
+    }
+}
+
+// The same where each answer is a line.
+template <class Work>
+void AnswerFailureInLine(const Work& work) {
+    try {
+        work();
+    } catch (const Failure& failure) {
+        nlohmann::ordered_json line;
+        AddProblem(failure.problem(), line);
+        PrintJsonLine(line.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace));
         throw;
     }
 }

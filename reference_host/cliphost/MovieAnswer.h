@@ -16,6 +16,7 @@ namespace cliphost {
 // How descriptions are shown and saved.
 struct DescriptionForm {
     bool json = false;
+    bool lines = false;  // JSON of one line for each movie
     bool quiet = false;
     PathMaps maps;  // of the locators
 };

@@ -5,19 +5,31 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <csignal>
+#include <cstdio>
 
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PrivateFile.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/OutputStream.h"
 #include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
 
 using host::DisplayPath;
+using host::system::DelayedSignals;
+
+namespace {
+
+constexpr char kStopsSoon[] =
+    "cliphost: stops after the movie at hand; interrupt it again to stop at once\n";
+
+}  // namespace
 
 template <class Work>
 void MoviesRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work& work) {
@@ -26,7 +38,9 @@ void MoviesRun::GoOnAfterFailure(const std::filesystem::path& movie, const Work&
     } catch (const Failure& failure) {
         ++failed_;
         status_ = std::max(status_, failure.status());
-        TellProblem(failure.problem(), session_.verbosity());
+        if (TellsFailures()) {
+            TellProblem(failure.problem(), session_.verbosity());
+        }
         ShowFailure(movie, failure.problem());
     } catch (const ReaderGone&) {
         // It has seen enough.
@@ -39,116 +53,145 @@ void MoviesRun::TellAlso(const Failure& failure) {
 }
 
 int MoviesRun::Run() {
+    plan_.emplace(session_, options_, ending_);
+    RefuseOneForAllOntoMovie();
+    const bool isForWorkers = IsForWorkers();
+    std::optional<DelayedSignals> signals;
+    if (isForWorkers || plan().size() > 1) {
+        signals.emplace(isForWorkers ? nullptr : kStopsSoon);
+    }
     std::optional<OutputFolder> folder;
     if (!options_.outFolder.empty()) {
         folder.emplace(options_.outFolder);
+        LookAtMovies();
     }
-    Plan();
-    RefuseOneForAllOntoMovie();
-    std::size_t movies = 0;
-    bool isOurs = false;  // a descriptor is that of this process
-    for (std::size_t i = 0; i < steps_.size(); ++i) {
-        const MovieStep step = StepAt(i);
-        movies += step.IsMovie() ? 1 : 0;
-        isOurs = isOurs || host::system::NamesDescriptor(step.movie);
-    }
-    const bool isForWorkers =
-        options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
     if (isForWorkers) {
         RunInChildren();
     } else {
         RunHere();
     }
+    isStopped_ = signals && DelayedSignals::HaveCome();
     Finish(done_, failed_);
+    if (isStopped_) {
+        TellStop();
+        std::fflush(stdout);  // the signal may end the program
+    }
     return status_;
 }
 
-void MoviesRun::Add(MovieStep step) {
-    steps_.push_back({kNoList, static_cast<std::uint32_t>(others_.size())});
-    others_.push_back(std::move(step));
-}
-
-MovieStep MoviesRun::StepAt(std::size_t number) const {
-    const Planned& planned = steps_[number];
-    if (planned.list == kNoList) {
-        return others_[planned.place];
+bool MoviesRun::IsForWorkers() const {
+    std::size_t movies = 0;
+    bool isOurs = false;  // a descriptor is that of this process
+    for (std::size_t i = 0; i < plan().size(); ++i) {
+        const MovieStep step = plan()[i];
+        movies += step.IsMovie() ? 1 : 0;
+        isOurs = isOurs || host::system::NamesDescriptor(step.movie);
+        RefuseDescriptor(options_.workers, step.movie);
     }
-    const std::shared_ptr<FolderClips>& folder = folders_[planned.list];
-    FolderClip clip = folder->clips()[planned.place];
-    return {std::move(clip.path), folder, clip.index, {}, {}};
+    return options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
 }
 
-void MoviesRun::Plan() {
-    for (const std::filesystem::path& path : options_.paths) {
-        std::error_code ignored;
-        if (!std::filesystem::is_directory(path, ignored)) {
-            Add({path.native(), {}, 0, {}, {}});
+void MoviesRun::LookAtMovies() {
+    if (options_.skipDone) {
+        doneMovies_.emplace(options_.outFolder, SettingsText(session_, options_.workers.arguments));
+        for (const std::filesystem::path& file : doneMovies_->Load()) {
+            Notice("cliphost: {}: can't be read; what it tells of is done again\n",
+                   DisplayPath(file));
+        }
+    }
+    looks_.resize(plan().size());
+    for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
+        const MovieStep step = plan()[i];
+        if (!step.IsMovie()) {
             continue;
         }
-        try {
-            PlanFolder(path);
-        } catch (const Failure& failure) {
-            Refuse(path, failure.status(), failure.problem());
+        Look& look = looks_[i];
+        look.state = host::system::StateOf(step.movie);
+        if (doneMovies_ && look.state) {
+            const auto output = OutputName(step.movie, plan().NumberOf(i), ending_);
+            look.isDone = doneMovies_->Has(step.movie, *look.state, output);
+            doneBefore_ += look.isDone ? 1 : 0;
         }
     }
 }
 
-void MoviesRun::PlanFolder(const std::filesystem::path& folder) {
-    const auto path = PathForModule(folder);
-    if (!IsClaimed(session_, path.get())) {
-        throw Failure(kExitFile, NotClaimed(folder));
+void MoviesRun::Remember(std::size_t place, const MovieStep& step,
+                         const std::filesystem::path& saved) {
+    if (looks_.empty() || !looks_[place].state) {
+        return;
     }
-    const auto clips = std::make_shared<FolderClips>(session_, folder);
-    for (const std::filesystem::path& name : clips->others().withBackslash) {
-        Refuse(name, kExitCaller, BackslashProblem(name));
-    }
-    for (const Problem& problem : clips->others().noFiles) {
-        Refuse(problem.subject, kExitCaller, problem);
-    }
-    if (const Problem leftOut = LeftOut(folder, clips->others())) {
-        Add({folder.native(), {}, 0, {}, std::make_shared<const Problem>(leftOut)});
-    }
-    const auto list = static_cast<std::uint32_t>(folders_.size());
-    folders_.push_back(clips);
-    steps_.reserve(steps_.size() + clips->clips().size());
-    for (std::uint32_t place = 0; place < clips->clips().size(); ++place) {
-        steps_.push_back({list, place});
+    if (options_.skipDone) {
+        Record(place, step, saved.filename(), DoneMovies::Known::ByContent);
+    } else {
+        outputs_.emplace_back(static_cast<std::uint32_t>(place), saved.filename());
     }
 }
 
-void MoviesRun::Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
-    Add({path.native(), {}, 0, std::make_shared<const Failure>(status, problem), {}});
+void MoviesRun::Record(std::size_t place, const MovieStep& step,
+                       const std::filesystem::path& output, DoneMovies::Known known) {
+    if (!canRecord_) {
+        return;
+    }
+    try {
+        if (!doneMovies_) {
+            doneMovies_.emplace(options_.outFolder,
+                                SettingsText(session_, options_.workers.arguments));
+        }
+        doneMovies_->Add(step.movie, *looks_[place].state, output, known);
+    } catch (const Failure& failure) {
+        canRecord_ = false;
+        TellAlso(failure);
+    }
+}
+
+void MoviesRun::TellStop() {
+    if (DelayedSignals::Which() == SIGPIPE) {
+        return;  // who reads what is printed has seen enough
+    }
+    // A run that keeps no record from the start keeps one for the next.
+    for (const auto& [place, output] : outputs_) {
+        Record(place, plan()[place], output, DoneMovies::Known::ByDate);
+    }
+    const bool goesOn = !options_.outFolder.empty() && canRecord_;
+    int all = 0;
+    for (std::size_t i = 0; i < plan().size(); ++i) {
+        all += plan()[i].notice ? 0 : 1;
+    }
+    const int done = done_ + doneBefore_;
+    Notice("cliphost: stopped by signal {}: {} of {} done, {} failed, {} left{}\n",
+           DelayedSignals::Which(), done, Counted(static_cast<std::uint64_t>(all), "movie"),
+           failed_, all - done - failed_, goesOn ? "; the same call with --skip-done goes on" : "");
 }
 
 // It is written when all movies were read: none of them may be there.
 void MoviesRun::RefuseOneForAllOntoMovie() const {
     if (!options_.together.empty() && host::system::NumberOf(options_.together)) {
-        for (std::size_t i = 0; i < steps_.size(); ++i) {
-            RefuseOutputOntoMovie(options_.together, StepAt(i).movie);
+        for (std::size_t i = 0; i < plan().size(); ++i) {
+            RefuseOutputOntoMovie(options_.together, plan()[i].movie);
         }
     }
 }
 
 void MoviesRun::RunHere() {
-    if (steps_.size() > 1) {
-        progress_.emplace(doing_, steps_.size());
+    if (plan().size() > 1) {
+        progress_.emplace(doing_, plan().size());
     }
-    for (std::size_t i = 0; i < steps_.size(); ++i) {
-        const MovieStep step = StepAt(i);
+    for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
+        const MovieStep step = plan()[i];
         if (progress_) {
             progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
         }
-        if (!step.IsMovie()) {
-            TellInstead(step);
+        if (!IsToDo(i)) {
+            TellInstead(i);
             continue;
         }
         GoOnAfterFailure(step.movie, [&] {
             std::filesystem::path saved;
             const MovieAnswer answer = Answer(step, [&] {
-                saved = options_.Saves() ? TargetFor(step.movie) : std::filesystem::path();
+                saved = options_.Saves() ? TargetFor(i, step) : std::filesystem::path();
                 return saved;
             });
-            Settle(step.movie, answer, options_.together.empty() ? saved : options_.together);
+            Settle(i, step, answer, options_.together.empty() ? saved : options_.together);
         });
     }
     progress_.reset();
@@ -167,20 +210,18 @@ std::filesystem::path MoviesRun::PlaceToWrite() const {
 }
 
 void MoviesRun::RunInChildren() {
-    for (std::size_t i = 0; i < steps_.size(); ++i) {
-        if (StepAt(i).IsMovie()) {
+    for (std::size_t i = 0; i < plan().size(); ++i) {
+        if (IsToDo(i)) {
             placesOfRequests_.push_back(static_cast<std::uint32_t>(i));
         }
     }
     // The children open each movie by its path.
-    for (const std::shared_ptr<FolderClips>& folder : folders_) {
-        folder->EndList();
-    }
+    plan_->EndLists();
     const WorkerRequests requests = {placesOfRequests_.size(), [this](std::size_t number) {
-                                         return StepAt(placesOfRequests_[number]).movie;
+                                         return plan()[placesOfRequests_[number]].movie;
                                      }};
     WorkerCall call = options_.workers;
-    if (!options_.together.empty()) {
+    if (Collects()) {
         call.writeNear = host::system::TemporaryFolder();
     } else if (options_.Saves()) {
         call.writeNear = PlaceToWrite();
@@ -188,12 +229,14 @@ void MoviesRun::RunInChildren() {
     progress_.emplace(doing_, requests.count);
     RunInWorkers(call, requests, *this);
     progress_.reset();
-    TellThoseBefore(steps_.size());
+    if (!DelayedSignals::HaveCome()) {
+        TellThoseBefore(plan().size());
+    }
 }
 
 void MoviesRun::TellThoseBefore(std::size_t place) {
     for (; nextPlace_ < place; ++nextPlace_) {
-        TellInstead(StepAt(nextPlace_));
+        TellInstead(nextPlace_);
     }
 }
 
@@ -205,20 +248,21 @@ void MoviesRun::Take(std::size_t number, const WorkerResult& result) {
     const std::size_t place = placesOfRequests_[number];
     TellThoseBefore(place);
     ++nextPlace_;
-    const MovieStep step = StepAt(place);
+    const MovieStep step = plan()[place];
     progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
     Notice("{}", result.told);
-    GoOnAfterFailure(step.movie, [&] { Deliver(step, number, result); });
+    GoOnAfterFailure(step.movie, [&] { Deliver(place, step, number, result); });
     answers_.erase(number);
 }
 
-void MoviesRun::Deliver(const MovieStep& step, std::size_t number, const WorkerResult& result) {
+void MoviesRun::Deliver(std::size_t place, const MovieStep& step, std::size_t number,
+                        const WorkerResult& result) {
     if (!result.failure.empty()) {
         throw Failure(kExitFile, step.movie, result.failure);
     }
     MovieAnswer& answer = answers_[number];
     std::filesystem::path saved;
-    if (!options_.together.empty() && answer.status == kExitFine) {
+    if (Collects() && answer.status == kExitFine) {
         const std::filesystem::path file = PrivateFile(result.folder, number);
         Collect(step.movie, file);
         std::error_code ignored;
@@ -228,61 +272,76 @@ void MoviesRun::Deliver(const MovieStep& step, std::size_t number, const WorkerR
         const std::filesystem::path file = PrivateFile(result.folder, number);
         const bool isSaved = answer.status == kExitFine;
         const bool isNotSaved = !isSaved && answer.problem.subject == file;
-        saved = isSaved || isNotSaved ? TargetFor(step.movie) : saved;
+        saved = isSaved || isNotSaved ? TargetFor(place, step) : saved;
         if (isNotSaved) {
             answer.problem.subject = saved;
         } else if (isSaved) {
             PutIntoPlace(file, saved);
         }
     }
-    Settle(step.movie, answer, saved);
+    Settle(place, step, answer, saved);
 }
 
-void MoviesRun::TellInstead(const MovieStep& step) {
-    if (step.notice) {
+void MoviesRun::TellInstead(std::size_t place) {
+    const MovieStep step = plan()[place];
+    if (IsDone(place)) {
+        if (session_.verbosity() > 0) {
+            Notice("cliphost: {}: is done already\n",
+                   DisplayPath(std::filesystem::path(step.movie)));
+        }
+        ShowDone(step.movie,
+                 options_.outFolder / OutputName(step.movie, plan().NumberOf(place), ending_));
+    } else if (step.notice) {
         TellProblem(*step.notice, session_.verbosity());
     } else {
         GoOnAfterFailure(step.movie, [&] { throw *step.refusal; });
     }
 }
 
-void MoviesRun::Settle(const std::filesystem::path& movie, const MovieAnswer& answer,
+void MoviesRun::Settle(std::size_t place, const MovieStep& step, const MovieAnswer& answer,
                        const std::filesystem::path& saved) {
     if (answer.status != kExitFine) {
         throw Failure(answer.status, answer.problem);
     }
     ++done_;
+    // What lacks something is made again each time, and told.
+    if (!answer.isPartial) {
+        Remember(place, step, saved);
+    }
     status_ = std::max(status_, answer.isPartial ? kExitFile : kExitFine);
-    Show(movie, answer, saved);
+    Show(step.movie, answer, saved);
 }
 
-// The paths of the command line by the files that they name.
-const MoviesRun::PathsByFile& MoviesRun::Given() {
-    if (given_.empty()) {
-        for (const std::filesystem::path& path : options_.paths) {
-            if (const auto number = host::system::NumberOf(path)) {
-                given_.emplace(*number, &path);
+// The movies that the caller named by the files that they are.
+const MoviesRun::PlacesByFile& MoviesRun::Named() {
+    if (named_.empty()) {
+        for (std::size_t i = 0; i < plan().size(); ++i) {
+            const auto number =
+                plan().IsNamed(i) ? host::system::NumberOf(plan()[i].movie) : std::nullopt;
+            if (number) {
+                named_.emplace(*number, i);
             }
         }
     }
-    return given_;
+    return named_;
 }
 
-std::filesystem::path MoviesRun::TargetFor(const std::filesystem::path& movie) {
+std::filesystem::path MoviesRun::TargetFor(std::size_t place, const MovieStep& step) {
     std::filesystem::path target = options_.file;
-    // Movies of one name in different folders get numbers.
-    for (int number = 1; target.empty(); ++number) {
-        std::filesystem::path name = movie.stem();
-        name += number == 1 ? ending_ : fmt::format("-{}{}", number, ending_);
+    if (const unsigned number = plan().NumberOf(place)) {
+        target = options_.outFolder / OutputName(step.movie, number, ending_);
+    }
+    for (unsigned number = 1; target.empty(); ++number) {
+        const std::filesystem::path name = OutputName(step.movie, number, ending_);
         if (targetsTaken_.insert(name.native()).second) {
             target = options_.outFolder / name;
         }
     }
     const auto inItsPlace = host::system::NumberOf(target);
     if (inItsPlace) {
-        RefuseOutputOntoMovie(target, movie);
-        if (const auto other = Given().find(*inItsPlace); other != Given().end()) {
-            RefuseOutputOntoMovie(target, *other->second);
+        RefuseOutputOntoMovie(target, step.movie);
+        if (const auto other = Named().find(*inItsPlace); other != Named().end()) {
+            RefuseOutputOntoMovie(target, plan()[other->second].movie);
         }
     }
     return target;

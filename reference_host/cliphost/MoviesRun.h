@@ -11,37 +11,18 @@
 #include <string>
 #include <vector>
 
-#include "reference_host/cliphost/FolderClips.h"
+#include "reference_host/cliphost/DoneMovies.h"
 #include "reference_host/cliphost/MovieAnswer.h"
+#include "reference_host/cliphost/MoviePlan.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/Workers.h"
 #include "reference_host/system/FileNumber.h"
 
 namespace cliphost {
 
-struct MoviesOptions {
-    std::vector<std::filesystem::path> paths;  // movies and folders
-    std::filesystem::path file;                // for what is made of the only movie
-    std::filesystem::path outFolder;           // for what is made of each
-    std::filesystem::path together;            // for what is made of all
-    WorkerCall workers;                        // without `writeNear`
-
-    bool Saves() const { return !file.empty() || !outFolder.empty(); }
-};
-
-// One movie of a command line, or what is told in its place.
-struct MovieStep {
-    std::filesystem::path::string_type movie;   // as in FolderClip
-    std::shared_ptr<const FolderClips> folder;  // where it is out of a list
-    ncfSInt32 index = 0;                        // in that
-    std::shared_ptr<const Failure> refusal;     // it can't be asked for
-    std::shared_ptr<const Problem> notice;      // no movie is meant
-
-    bool IsMovie() const { return !refusal && !notice; }
-};
-
 // What a verb does with all movies of the command line; a bad one does not stop the rest. Several
-// are given to processes of their own where the options say so.
+// are given to processes of their own where the options say so. A signal that asks the program to
+// end stops it between two movies; it takes its effect when all is told and put away.
 class MoviesRun : private WorkerClient {
 public:
     virtual ~MoviesRun() = default;
@@ -60,60 +41,76 @@ protected:
     virtual void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
                       const std::filesystem::path& saved) = 0;
     virtual void ShowFailure(const std::filesystem::path&, const Problem&) {}
+    virtual void ShowDone(const std::filesystem::path& /*movie*/,
+                          const std::filesystem::path& /*output*/) {}
+    // Whether a failure is told on standard error, too.
+    virtual bool TellsFailures() const { return true; }
     // What is made of all takes the file that a child process has made of one.
+    virtual bool Collects() const { return !options_.together.empty(); }
     virtual void Collect(const std::filesystem::path& /*movie*/,
                          const std::filesystem::path& /*file*/) {}
     // After all.
     virtual void Finish(int /*done*/, int /*failed*/) {}
+    // For Finish: how many were left out, and whether a signal stopped the run.
+    int doneBefore() const { return doneBefore_; }
+    bool IsStopped() const { return isStopped_; }
 
     Session& session() { return session_; }
     // Tells a problem that is not a movie's; it counts for the exit status.
     void TellAlso(const Failure& failure);
 
 private:
-    void Plan();
-    void PlanFolder(const std::filesystem::path& folder);
-    void Refuse(const std::filesystem::path& path, int status, const Problem& problem);
     void RefuseOneForAllOntoMovie() const;
+    bool IsForWorkers() const;
+    // Finds those that are done already, and what all others are before they are read.
+    void LookAtMovies();
     void RunHere();
     void RunInChildren();
     std::filesystem::path PlaceToWrite() const;
-    void TellInstead(const MovieStep& step);
+    bool IsDone(std::size_t place) const { return !looks_.empty() && looks_[place].isDone; }
+    // Whether its movie is to be read.
+    bool IsToDo(std::size_t place) const { return !IsDone(place) && plan()[place].IsMovie(); }
+    void TellInstead(std::size_t place);
     void TellThoseBefore(std::size_t place);
     bool Read(std::size_t number, const std::string& answer) override;
     void Take(std::size_t number, const WorkerResult& result) override;
-    void Deliver(const MovieStep& step, std::size_t number, const WorkerResult& result);
-    void Settle(const std::filesystem::path& movie, const MovieAnswer& answer,
+    void Deliver(std::size_t place, const MovieStep& step, std::size_t number,
+                 const WorkerResult& result);
+    void Settle(std::size_t place, const MovieStep& step, const MovieAnswer& answer,
                 const std::filesystem::path& saved);
+    void Remember(std::size_t place, const MovieStep& step, const std::filesystem::path& saved);
+    void Record(std::size_t place, const MovieStep& step, const std::filesystem::path& output,
+                DoneMovies::Known known);
+    void TellStop();
     // Does one movie; what it fails with is told, and the next one goes on.
     template <class Work>
     void GoOnAfterFailure(const std::filesystem::path& movie, const Work& work);
-    using PathsByFile = std::map<host::system::FileNumber, const std::filesystem::path*>;
-    const PathsByFile& Given();
-    std::filesystem::path TargetFor(const std::filesystem::path& movie);
+    using PlacesByFile = std::map<host::system::FileNumber, std::size_t>;
+    const PlacesByFile& Named();
+    std::filesystem::path TargetFor(std::size_t place, const MovieStep& step);
+    const MoviePlan& plan() const { return *plan_; }
 
     Session& session_;
     const MoviesOptions& options_;
     const char* doing_;
     const char* ending_;
-    // Of movies out of lists only which they are: there may be 100,000.
-    struct Planned {
-        std::uint32_t list;   // among the folders; kNoList: `place` is one among the others
-        std::uint32_t place;  // among its movies
+    std::optional<MoviePlan> plan_;
+    struct Look {
+        std::optional<host::system::FileState> state;  // before the movie was read
+        bool isDone = false;                           // its output is there
     };
-    static constexpr std::uint32_t kNoList = 0xFFFFFFFF;
-    void Add(MovieStep step);
-    MovieStep StepAt(std::size_t number) const;
-
-    std::vector<Planned> steps_;
-    std::vector<std::shared_ptr<FolderClips>> folders_;
-    std::vector<MovieStep> others_;
+    std::vector<Look> looks_;                      // where there is a folder for outputs
     std::vector<std::uint32_t> placesOfRequests_;  // among the steps
     std::size_t nextPlace_ = 0;
     std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
     std::optional<Progress> progress_;
     std::set<std::string> targetsTaken_;  // names in the folder
-    PathsByFile given_;
+    PlacesByFile named_;
+    std::optional<DoneMovies> doneMovies_;
+    bool canRecord_ = true;
+    std::vector<std::pair<std::uint32_t, std::string>> outputs_;  // of places; for a stop
+    int doneBefore_ = 0;
+    bool isStopped_ = false;
     int done_ = 0;
     int failed_ = 0;
     int status_ = kExitFine;  // the highest of all failures

@@ -50,7 +50,7 @@ OutputFile::OutputFile(std::filesystem::path path, Writer writer) : path_(std::m
 
 void OutputFile::Write(const void* bytes, std::size_t size) {
     const int error = stream_.Write(bytes, size);
-    if (error == EPIPE) {
+    if (error == EPIPE || error == EINTR) {  // a signal asks us to end
         throw ReaderGone();
     }
     Check(error);

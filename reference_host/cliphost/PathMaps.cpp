@@ -63,14 +63,6 @@ void TakeMachineFromPath(UrlPlace& place) {
     place.path = path.substr(end);
 }
 
-bool ReadUrl(std::string_view url, UrlPlace& place) {
-    if (!host::text::SplitFileUrl(url, place.machine, place.path)) {
-        return false;
-    }
-    TakeMachineFromPath(place);
-    return true;
-}
-
 bool ReadPath(std::string text, UrlPlace& place) {
     const bool isDrive = text.size() > 1 && IsLetter(text[0]) && text[1] == ':';
     if (isDrive || text[0] == '\\') {
@@ -85,7 +77,7 @@ bool ReadPath(std::string text, UrlPlace& place) {
 }
 
 bool ReadPlace(const std::string& text, UrlPlace& place) {
-    return host::text::IsFileUrl(text) ? ReadUrl(text, place) : ReadPath(text, place);
+    return host::text::IsFileUrl(text) ? ReadFileUrl(text, place) : ReadPath(text, place);
 }
 
 void DropSlashAtEnd(std::string& path) {
@@ -95,6 +87,14 @@ void DropSlashAtEnd(std::string& path) {
 }
 
 }  // namespace
+
+bool ReadFileUrl(std::string_view url, UrlPlace& place) {
+    if (!host::text::SplitFileUrl(url, place.machine, place.path)) {
+        return false;
+    }
+    TakeMachineFromPath(place);
+    return true;
+}
 
 bool UrlPlace::IgnoresCase() const {
     return !machine.empty() || BeginsWithDrive(path);
@@ -146,7 +146,7 @@ bool PathMaps::MapToThis(std::string& url) {
 
 bool PathMaps::Map(std::string& url, UrlPlace Rule::*from, UrlPlace Rule::*to) {
     UrlPlace file;
-    if (!ReadUrl(url, file)) {
+    if (!ReadFileUrl(url, file)) {
         return false;
     }
     const Rule* best = nullptr;

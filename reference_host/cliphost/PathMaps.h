@@ -18,6 +18,10 @@ struct UrlPlace {
     bool IgnoresCase() const;
 };
 
+// The file that a URL names, with the machine taken from its path where it stands there; false for
+// what is no URL of a file.
+bool ReadFileUrl(std::string_view url, UrlPlace& place);
+
 // The same folders as this machine and another one see them.
 class PathMaps {
 public:

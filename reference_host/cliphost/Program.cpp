@@ -110,6 +110,8 @@ int Run(int argc, char** argv) {
     AddContact(app, session, status);
     AddAudio(app, session, status);
     AddDump(app, session);
+    AddVerify(app, session, status);
+    AddRelink(app, session, status);
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);

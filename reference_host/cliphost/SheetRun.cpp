@@ -92,4 +92,10 @@ void SheetRun::Show(const std::filesystem::path&, const MovieAnswer& answer,
     }
 }
 
+void SheetRun::Finish(int made, int failed) {
+    if (doneBefore() > 0) {
+        fmt::print("{} made, {} not, {} done already\n", made, failed, doneBefore());
+    }
+}
+
 }  // namespace cliphost

@@ -44,6 +44,7 @@ private:
     }
     void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
               const std::filesystem::path& saved) override;
+    void Finish(int made, int failed) override;
 
     const SheetsOptions& options_;
 };

@@ -20,6 +20,8 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status);
 void AddTypes(CLI::App& app, const SessionOptions& session, int& status);
 void AddParams(CLI::App& app, const SessionOptions& session, int& status);
 void AddDump(CLI::App& app, const SessionOptions& session);
+void AddVerify(CLI::App& app, const SessionOptions& session, int& status);
+void AddRelink(CLI::App& app, const SessionOptions& session, int& status);
 void AddHelpFiles(CLI::App& app);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
 

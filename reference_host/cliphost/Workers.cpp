@@ -16,10 +16,12 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Fields.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/system/ChildProcess.h"
 #include "reference_host/system/Confinement.h"
 #include "reference_host/system/DelayedSignals.h"
+#include "reference_host/system/FileNumber.h"
 #include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
@@ -84,6 +86,7 @@ private:
     int Start(Worker& worker);
     void GiveUp(Worker& worker, const std::string& why);
     std::optional<std::size_t> NextRequest();
+    bool IsAtRetried(const Worker& worker) const;
     std::size_t RequestsAhead() const;
     bool AllHaveEnough() const;
     void Wait();
@@ -142,7 +145,8 @@ void Run::GoOn() {
         for (const auto& worker : workers_) {
             Listen(*worker);
         }
-        for (auto first = waiting_.find(taken_); first != waiting_.end();
+        for (auto first = waiting_.find(taken_);
+             first != waiting_.end() && !host::system::DelayedSignals::HaveCome();
              first = waiting_.find(taken_)) {
             client_.Take(first->first, first->second);
             waiting_.erase(first);
@@ -155,14 +159,15 @@ void Run::HandOut() {
     for (std::size_t depth = 1, most = RequestsAhead(); depth <= most; ++depth) {
         for (const auto& held : workers_) {
             Worker& worker = *held;
-            if (worker.isGivenUp || worker.requests.size() >= depth) {
+            if (worker.isGivenUp || worker.requests.size() >= depth || IsAtRetried(worker)) {
                 continue;
             }
             const std::optional<std::size_t> request = NextRequest();
             if (!request) {
                 return;
             }
-            if (worker.answered > 0 && retried_.count(*request) > 0) {
+            const bool isUsed = worker.answered > 0 || !worker.requests.empty();
+            if (isUsed && retried_.count(*request) > 0) {
                 if (!worker.requests.empty()) {
                     again_.push_front(*request);
                     continue;
@@ -178,6 +183,10 @@ void Run::HandOut() {
             HandTo(worker, *request);
         }
     }
+}
+
+bool Run::IsAtRetried(const Worker& worker) const {
+    return !worker.requests.empty() && retried_.count(worker.requests.front()) > 0;
 }
 
 // The next requests lie ready where a process ends one. Where each takes long, others may
@@ -239,7 +248,7 @@ void Run::GiveUp(Worker& worker, const std::string& why) {
     worker.isGivenUp = true;
     if (std::all_of(workers_.begin(), workers_.end(),
                     [](const auto& one) { return one->isGivenUp; })) {
-        throw Failure(kExitCaller, call_.program, why, "try --jobs 1");
+        throw Failure(kExitCaller, call_.program, why, call_.jobs > 1 ? "try --jobs 1" : "");
     }
 }
 
@@ -339,11 +348,15 @@ void Run::LeaveOut(Clock::duration time) {
 
 void Run::Lose(Worker& worker, const std::string& why) {
     worker.process.End();
+    if (worker.isReady && worker.requests.empty()) {
+        return;
+    }
+    if (!worker.requests.empty()) {
+        RemovePrivateFiles(worker.folder, worker.requests.front());
+    }
     if (!worker.isReady) {
         Notice("{}", TakeTold(worker));
         GiveUp(worker, "a process that reads movies did not start");
-    } else if (worker.requests.empty()) {
-        return;
     } else if (worker.answered > 0 && retried_.insert(worker.requests.front()).second) {
         TakeTold(worker);  // it may have come to harm by a movie before: a process of its own tells
     } else {
@@ -363,6 +376,12 @@ void Run::Settle(Worker& worker, const std::string& failure) {
 }
 
 }  // namespace
+
+void RefuseDescriptor(const WorkerCall& call, const std::filesystem::path& movie) {
+    if (call.limits.AreSet() && host::system::NamesDescriptor(movie)) {
+        throw Failure(kExitCaller, movie, "limits can't be kept for a descriptor", "name the file");
+    }
+}
 
 void RunInWorkers(const WorkerCall& call, const std::vector<std::string>& requests,
                   WorkerClient& client) {

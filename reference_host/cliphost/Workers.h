@@ -36,6 +36,9 @@ struct WorkerCall {
     std::size_t mostWaiting = 256;
 };
 
+// Throws a Failure where limits are set for a movie that no other process can open.
+void RefuseDescriptor(const WorkerCall& call, const std::filesystem::path& movie);
+
 // What became of one request.
 struct WorkerResult {
     std::string told;              // what the process wrote on standard error

@@ -2,19 +2,52 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/DelayedSignals.h"
 
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstring>
+#include <ctime>
+
+#include "reference_host/system/UnfinishedFile.h"
+
 namespace host::system {
 namespace {
 
 volatile std::sig_atomic_t noted = 0;
+volatile std::time_t notedAt = 0;
+const char* volatile lineToWrite = nullptr;
+int objects = 0;
+
+// Some senders send a signal twice at once, to the program and to its group.
+bool IsSecond() {
+    return noted != 0 && std::time(nullptr) > notedAt + 1;
+}
 
 extern "C" void NoteSignal(int signal) {
-    noted = signal;
+    const int error = errno;
+    const char* const line = lineToWrite;
+    if (line != nullptr && IsSecond()) {
+        EndBySignal(signal);
+    } else if (noted == 0) {
+        notedAt = std::time(nullptr);
+        noted = signal;
+        // Who closed a pipe has had enough.
+        if (line != nullptr && signal != SIGPIPE &&
+            write(STDERR_FILENO, line, std::strlen(line)) < 0) {
+            // Nobody is there to read it.
+        }
+    }
+    errno = error;
 }
 
 }  // namespace
 
-DelayedSignals::DelayedSignals() {
+DelayedSignals::DelayedSignals(const char* line) {
+    if (objects++ > 0) {
+        return;
+    }
     noted = 0;
+    lineToWrite = line;
     for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE}) {
         Before before{signal, {}};
         if (sigaction(signal, nullptr, &before.action) != 0 ||
@@ -22,7 +55,9 @@ DelayedSignals::DelayedSignals() {
             continue;
         }
         struct sigaction action {};
-        action.sa_handler = NoteSignal;  // waits are cut short: no SA_RESTART
+        action.sa_handler = NoteSignal;
+        // Reading a movie goes on; otherwise waits are cut short.
+        action.sa_flags = line != nullptr ? SA_RESTART : 0;
         if (sigaction(signal, &action, nullptr) == 0) {
             before_.push_back(before);
         }
@@ -30,16 +65,23 @@ DelayedSignals::DelayedSignals() {
 }
 
 DelayedSignals::~DelayedSignals() {
+    if (--objects > 0) {
+        return;
+    }
     for (const Before& before : before_) {
-        sigaction(before.signal, &before.action, nullptr);
+        struct sigaction present {};
+        // What somebody has settled since then stays.
+        if (sigaction(before.signal, nullptr, &present) == 0 && present.sa_handler == NoteSignal) {
+            sigaction(before.signal, &before.action, nullptr);
+        }
     }
     if (noted != 0) {
         std::raise(noted);
     }
 }
 
-bool DelayedSignals::HaveCome() {
-    return noted != 0;
+int DelayedSignals::Which() {
+    return noted;
 }
 
 }  // namespace host::system

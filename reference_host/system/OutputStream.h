@@ -16,7 +16,7 @@ bool IsStandardOutput(const std::filesystem::path& path);
 // system's error numbers; 0: none.
 class OutputStream {
 public:
-    OutputStream();
+    OutputStream() = default;
     ~OutputStream() { Close(); }
     OutputStream(const OutputStream&) = delete;
     OutputStream& operator=(const OutputStream&) = delete;

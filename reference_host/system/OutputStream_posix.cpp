@@ -4,10 +4,10 @@
 #include <unistd.h>
 
 #include <cerrno>
-#include <csignal>
 #include <string_view>
 #include <utility>
 
+#include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/OutputStream.h"
 #include "reference_host/util/text/Number.h"
 
@@ -41,12 +41,6 @@ bool IsStandardOutput(const std::filesystem::path& path) {
     return DescriptorOf(path) == STDOUT_FILENO;
 }
 
-// A reader that goes away shows itself as a failed write, not as the end of this
-// program.
-OutputStream::OutputStream() {
-    std::signal(SIGPIPE, SIG_IGN);
-}
-
 int OutputStream::Open(const std::filesystem::path& path) {
     descriptor_ = open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
     return descriptor_ < 0 ? errno : 0;
@@ -61,7 +55,7 @@ int OutputStream::Write(const void* bytes, std::size_t size) {
     const char* from = static_cast<const char*>(bytes);
     while (size > 0) {
         const ssize_t done = write(descriptor_, from, size);
-        if (done < 0 && errno == EINTR) {
+        if (done < 0 && errno == EINTR && !DelayedSignals::HaveCome()) {
             continue;
         }
         if (done <= 0) {

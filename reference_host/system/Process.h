@@ -7,8 +7,8 @@
 namespace host::system {
 
 // What a program settles with the system before it does anything else: standard
-// streams that the caller closed stay closed, and a file that outgrows its limit
-// fails to be written.
+// streams that the caller closed stay closed, and a file that outgrows its limit or
+// a pipe that nobody reads any more fails to be written.
 void PrepareProcess();
 
 // The file that runs. `name` is what the caller called it.

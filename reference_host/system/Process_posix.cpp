@@ -11,8 +11,9 @@
 namespace host::system {
 
 void PrepareProcess() {
-    // The signal would end us.
+    // These signals would end us; what is written fails instead.
     std::signal(SIGXFSZ, SIG_IGN);
+    std::signal(SIGPIPE, SIG_IGN);
     // A stream that the caller closed would give its number to the next file that is
     // opened, and what is printed would go into that file.
     for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {

@@ -28,4 +28,7 @@ private:
     int slot_ = -1;  // where the signal handler finds the name
 };
 
+// For a signal handler: removes such files and ends the program by the signal.
+extern "C" void EndBySignal(int signal);
+
 }  // namespace host::system

@@ -24,23 +24,12 @@ struct Slot {
 };
 Slot slots[4];
 
-extern "C" void RemoveUnfinishedFiles(int signal) {
-    for (Slot& slot : slots) {
-        if (slot.isNamed) {
-            unlink(slot.name);
-        }
-    }
-    // The signal comes again once this returns, and then ends the program.
-    std::signal(signal, SIG_DFL);
-    std::raise(signal);
-}
-
 // Signals that the caller had ignored, as nohup does, stay ignored.
 void WatchSignals() {
     for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE}) {
         struct sigaction present {};
         if (sigaction(signal, nullptr, &present) == 0 && present.sa_handler == SIG_DFL) {
-            std::signal(signal, RemoveUnfinishedFiles);
+            std::signal(signal, EndBySignal);
         }
     }
 }
@@ -81,6 +70,17 @@ std::filesystem::path NameBeside(const std::filesystem::path& place) {
 }
 
 }  // namespace
+
+extern "C" void EndBySignal(int signal) {
+    for (Slot& slot : slots) {
+        if (slot.isNamed) {
+            unlink(slot.name);
+        }
+    }
+    // The signal comes again once this returns, and then ends the program.
+    std::signal(signal, SIG_DFL);
+    std::raise(signal);
+}
 
 UnfinishedFile::UnfinishedFile(const std::filesystem::path& place)
     : place_(BehindLinks(place)), path_(NameBeside(place_)) {

@@ -17,6 +17,8 @@
 #include <cstdio>
 #include <cstring>
 #include <filesystem>
+#include <fstream>
+#include <stdexcept>
 #include <string>
 #include <thread>
 #include <vector>
@@ -83,6 +85,18 @@ void TryEverything(const std::filesystem::path& movie) {
     Tell("program", false);
 }
 
+// The folder that this process may write.
+std::filesystem::path OwnFolder() {
+    std::ifstream line("/proc/self/cmdline");
+    const std::string option = "--folder=";
+    for (std::string word; std::getline(line, word, '\0');) {
+        if (word.compare(0, option.size(), option) == 0) {
+            return word.substr(option.size());
+        }
+    }
+    return {};
+}
+
 void DoHarm(const std::string& harm, const std::filesystem::path& movie) {
     if (harm == "crash") {
         std::signal(SIGSEGV, SIG_DFL);  // a sanitizer has its own
@@ -106,6 +120,16 @@ void DoHarm(const std::string& harm, const std::filesystem::path& movie) {
         const std::array<unsigned char, 12> answer = {4, 0, 0, 0, 0, 0, 0, 0, 'o', 'd', 'd', '!'};
         Send(answer.data(), answer.size());
         pause();
+    } else if (harm == "throw") {
+        throw std::runtime_error("thrown by the module");
+    } else if (harm == "remove" || harm == "shorten") {
+        for (const auto& entry : std::filesystem::directory_iterator(OwnFolder())) {
+            if (harm == "remove") {
+                std::filesystem::remove(entry.path());
+            } else {
+                std::filesystem::resize_file(entry.path(), 5);
+            }
+        }
     } else if (harm == "probe") {
         TryEverything(movie);
     } else if (harm == "controls") {
@@ -157,7 +181,13 @@ public:
         DoHarm(HarmAt(movie_, frame), movie_);
         return provider_->ProvideSampleRange(request, flags);
     }
-    NCFRESULT Setup(ncfUInt32 track) override { return provider_->Setup(track); }
+    NCFRESULT Setup(ncfUInt32 track) override {
+        // The process that reads a range's plan has no folder.
+        if (movie_.stem() == "crash-at-setup" && !OwnFolder().empty()) {
+            DoHarm("crash", movie_);
+        }
+        return provider_->Setup(track);
+    }
     NCFRESULT ProviderUnsupportedOperation(ncfUInt32 track, ncfUInt64 a, ncfUInt64 b) override {
         return provider_->ProviderUnsupportedOperation(track, a, b);
     }

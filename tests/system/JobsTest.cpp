@@ -6,6 +6,7 @@
 // the range, alone.
 
 #include <signal.h>
+#include <sys/ioctl.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -17,6 +18,7 @@
 #include <sstream>
 #include <thread>
 
+#include "reference_host/cliphost/FrameSink.h"
 #include "tests/system/Command.h"
 #include "tests/system/SystemTest.h"
 
@@ -429,7 +431,9 @@ TEST_F(Jobs, EndWithTheProgram) {
         }
         EXPECT_TRUE(ProcessesOf(folder().string()).empty());
         if (signal != SIGKILL) {
-            EXPECT_EQ(NamesIn(folder() / "out"), std::set<std::string>{"hang-not.aaf"});
+            // And the record by which another run goes on.
+            EXPECT_EQ(NamesIn(folder() / "out"),
+                      (std::set<std::string>{".cliphost-done", "hang-not.aaf"}));
         }
         std::filesystem::remove_all(folder() / "out");
     }
@@ -501,6 +505,41 @@ TEST_F(JobsOfFrames, WriteTheSameOfAMovieOfLongGroups) {
         Quoted(Movie("long.mov", "-c:v libx264 -pix_fmt yuv420p -bf 2 -g 40 -sc_threshold 0"));
     EXPECT_EQ(ExpectTheSame(movie + " --range 5:", "a.raw", kSeveral).files.at("a.raw").size(),
               91u * 480 * 272 * 2);
+}
+
+// Such movies claim that every sample stands alone, and most of these samples don't.
+TEST_F(JobsOfFrames, WriteTheSameOfAMovieThatDoesNotListItsSyncSamples) {
+    const std::pair<const char*, const char*> codecs[] = {
+        {"rpza.mov", "-c:v rpza"},
+        {"mpeg2.mov", "-c:v mpeg2video -g 40 -bf 0"},
+        {"h264.mov", "-c:v libx264 -pix_fmt yuv420p -g 40 -bf 0"},
+        {"qtrle.mov", "-c:v qtrle -g 40"}};
+    for (const auto& [name, codec] : codecs) {
+        const auto movie = Movie(name, codec);
+        movies::Bytes bytes = ReadFile(movie);
+        const std::string list = "stss";
+        const auto at = std::search(bytes.begin(), bytes.end(), list.begin(), list.end());
+        std::copy_n("free", at == bytes.end() ? 0 : list.size(), at);
+        Write(bytes, "in/" + std::string(name));
+        const std::string call = Quoted(movie) + " --range ";
+        const Left whole = ExpectTheSame(call + "0:", "a.raw", kTwo);
+        EXPECT_EQ(whole.printed.status, 0) << name;
+        EXPECT_NE(whole.printed.out.find("96 raw frames"), std::string::npos) << name;
+        ExpectTheSame(call + "5::2", "a.raw", kTwo);
+    }
+}
+
+// After a lost piece, the frames that the next one leans on are decoded anew.
+TEST_F(JobsOfFrames, ReadOnBehindALostPieceFromWhereAllBegan) {
+    const auto movie = Movie("crash-at-40.mov", "-c:v rpza");
+    const std::string call = "frame " + Quoted(movie) + " --range 0: --jobs 2 -o ";
+    ASSERT_EQ(RunCliphost(call + In("whole")).status, 0);
+    ExpectSays(Harmed(call + In("some")), 1, "frames 39 to 51 are left out: ");
+    const auto pictures = NamesIn(folder() / "some");
+    EXPECT_EQ(pictures.size(), 39u);
+    for (const std::string& name : pictures) {
+        EXPECT_TRUE(ReadFile(folder() / "some" / name) == ReadFile(folder() / "whole" / name));
+    }
 }
 
 TEST_F(JobsOfFrames, TellFramesThatCantBeReadInOrder) {
@@ -602,6 +641,129 @@ TEST_F(JobsOfFrames, AreInPiecesThatBeginWithAPictureThatStandsAlone) {
              "frames 40 to 79 are left out: the process that read it was ended by signal 11"));
 }
 
+// The last frame is read when frames are counted.
+TEST_F(JobsOfFrames, LoseTheLastPieceAloneToHarmInTheLastFrame) {
+    const auto movie = Movie("p.mov", kProRes);
+    const std::pair<const char*, const char*> harms[] = {
+        {"crash-at-95.mov", "the process that read it was ended by signal 11"},
+        {"hang-at-95.mov", "took longer than 4 seconds"}};
+    for (const auto& [name, why] : harms) {
+        SCOPED_TRACE(name);
+        std::filesystem::copy_file(movie, folder() / "in" / name);
+        const std::string call = "frame " + In("in/" + std::string(name)) +
+                                 " --jobs 2 --limit-seconds 4 -o " + In("a.raw");
+        ExpectSays(Harmed(call + " --range 60:"), 1,
+                   Line(name, std::string("frames 84 to 95 are left out: ") + why) +
+                       (folder() / "a.raw").string() + ": 24 raw frames\n");
+        ExpectSays(Harmed(call + " --range :30"), 0, ": 30 raw frames\n");
+    }
+}
+
+// What it left of the piece is not taken, and the next process reads on.
+TEST_F(JobsOfFrames, LoseOnePieceToAProcessThatDoesNotLeaveWhatItAnswers) {
+    const auto movie = Movie("p.mov", kProRes);
+    const std::string unwhole = "the process that read it left no whole file of frame 12";
+    const std::tuple<const char*, const char*, std::string> harms[] = {
+        {"remove-at-13", "pictures", unwhole},
+        {"remove-at-13", "a.raw", unwhole},
+        {"shorten-at-13", "a.raw", unwhole},
+        {"throw-at-13", "a.raw", "thrown by the module"}};
+    for (const auto& [harm, output, why] : harms) {
+        SCOPED_TRACE(harm);
+        const std::string name = std::string(harm) + ".mov";
+        std::filesystem::copy_file(movie, folder() / "in" / name,
+                                   std::filesystem::copy_options::overwrite_existing);
+        ExpectSays(Harmed("frame " + In("in/" + name) + " --range 0:48 --jobs 2 -o " + In(output)),
+                   1, Line(name, "frames 12 to 23 are left out: " + why));
+    }
+    EXPECT_EQ(NamesIn(folder() / "pictures").size(), 36u);
+    EXPECT_EQ(std::filesystem::file_size(folder() / "a.raw"), 36u * 480 * 272 * 2);
+}
+
+TEST_F(JobsOfFrames, EndBySignalWhereNobodyReadsTheirOutput) {
+    const auto movie = Movie("p.mov", kProRes);
+    int ends[2];
+    ASSERT_EQ(pipe(ends), 0);
+    const pid_t program = fork();
+    ASSERT_GE(program, 0);
+    if (program == 0) {
+        setenv("TMPDIR", (folder() / "tmp").c_str(), 1);
+        dup2(ends[1], STDOUT_FILENO);
+        close(ends[0]);
+        close(ends[1]);
+        execl((ProgramFolder() / "cliphost").c_str(), "cliphost", "frame", movie.c_str(), "--range",
+              "0:", "--limit-seconds", "100", "-o", "-", nullptr);
+        _exit(127);
+    }
+    close(ends[1]);
+    int filled = 0;
+    for (int i = 0; i < 1000 && filled < 65536; ++i) {
+        std::this_thread::sleep_for(20ms);
+        ASSERT_EQ(ioctl(ends[0], FIONREAD, &filled), 0);
+    }
+    EXPECT_EQ(filled, 65536) << "what the pipe holds";
+    std::this_thread::sleep_for(200ms);
+    ASSERT_EQ(kill(program, SIGTERM), 0);
+    int status = 0;
+    pid_t ended = 0;
+    for (int i = 0; i < 500 && ended == 0; ++i) {
+        std::this_thread::sleep_for(20ms);
+        ended = waitpid(program, &status, WNOHANG);
+    }
+    EXPECT_EQ(ended, program) << "it goes on";
+    if (ended == 0) {
+        kill(program, SIGKILL);
+        waitpid(program, &status, 0);
+    }
+    close(ends[0]);
+    EXPECT_TRUE(WIFSIGNALED(status) && WTERMSIG(status) == SIGTERM) << status;
+    EXPECT_TRUE(NamesIn(folder() / "tmp").empty());
+}
+
+TEST_F(JobsOfFrames, NameTheFolderForTemporaryFilesThatIsFull) {
+    const std::string movie = Quoted(Movie("p.mov", kProRes));
+    const CommandResult ran =
+        RunCommand("ulimit -f 100; TMPDIR=" + In("tmp") + " " + Program() + " frame " + movie +
+                   " --range 0: --limit-seconds 100 -o - 2>&1 >/dev/null | cat");
+    EXPECT_NE(ran.out.find("cliphost: " + (folder() / "tmp").string() +
+                           ": not written: File too large; name another folder in TMPDIR\n"),
+              std::string::npos)
+        << ran.out;
+}
+
+TEST_F(JobsOfFrames, RefuseLimitsForADescriptor) {
+    const std::string movie = Quoted(MadeMovie("png.mov"));
+    for (const char* const verb : {"describe -q", "frame --range 0: -o a.raw"}) {
+        ExpectSays(
+            RunCommand(Program() + " " + verb + " /dev/stdin --limit-seconds 9 2>&1 <" + movie), 2,
+            "cliphost: /dev/stdin: limits can't be kept for a descriptor; name the file\n");
+    }
+}
+
+TEST_F(JobsOfFrames, TellTheSameOfAModuleThatIsNot) {
+    const std::string movie = Quoted(MadeMovie("png.mov"));
+    EXPECT_EQ(ExpectTheSame(movie + " --range 0:30 --plugin /no/such", "pictures", kSeveral)
+                  .printed.status,
+              2);
+}
+
+TEST_F(JobsOfFrames, TakeAFolderForAFolderWhateverItsName) {
+    std::filesystem::create_directories(folder() / "d.raw");
+    EXPECT_FALSE(cliphost::IsRawFile(folder() / "d.raw"));
+    EXPECT_TRUE(cliphost::IsRawFile(folder() / "e.raw"));
+}
+
+TEST_F(Jobs, EndAlikeWhereTheReaderOfWhatIsPrintedHasGone) {
+    Copy("a.mov");
+    Copy("b.mov");
+    for (const char* const rest : {" --jobs 1", " --jobs 2", " --jobs 2 --out-dir "}) {
+        const std::string out = rest[std::string(rest).size() - 1] == ' ' ? In("out") : "";
+        RunCommand("{ env --default-signal=PIPE " + Program() + " describe " + In("in") + rest +
+                   out + " 2>/dev/null; echo $? >" + In("status") + "; } | true");
+        EXPECT_EQ(ReadFile(folder() / "status"), (movies::Bytes{'0', '\n'})) << rest;
+    }
+}
+
 TEST_F(JobsOfFrames, LeaveALostPieceOutOfRawFrames) {
     const auto movie = Movie("crash-at-13.mov", kProRes);
     const std::string call = "frame " + Quoted(movie) + " --range 0:48 --jobs 2 -o ";
@@ -611,6 +773,14 @@ TEST_F(JobsOfFrames, LeaveALostPieceOutOfRawFrames) {
     rest.erase(rest.begin() + piece, rest.begin() + 2 * piece);
     ExpectSays(Harmed(call + In("a.raw")), 1, "frames 12 to 23 are left out: ");
     EXPECT_TRUE(ReadFile(folder() / "a.raw") == rest);
+}
+
+TEST_F(JobsOfFrames, TellWhatIsToldOfTheOpeningOnce) {
+    const auto movie = Movie("crash-at-setup.mov", kProRes);
+    const CommandResult ran =
+        Harmed("-v frame " + Quoted(movie) + " --range 0:48 --jobs 2 -o " + In("pictures"));
+    ExpectSays(ran, 1, "frames 36 to 47 are left out: ");
+    EXPECT_EQ(CountOf(ran.out, "Player negotiated"), 1u) << ran.out;
 }
 
 TEST_F(JobsOfFrames, LoseAMovieThatBreaksItsFirstReader) {

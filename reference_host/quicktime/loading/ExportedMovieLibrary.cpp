@@ -11,7 +11,7 @@ extern "C" __attribute__((visibility("default"))) const host::MovieLibrary* Clip
     static const host::MovieLibrary library = {
         host::MakeQuickTimeWrapper, host::MakeQuickTimeProperty, host::OpenProblem,
         host::DecoderProblem,       host::DecoderProblem,        host::RasterProblem,
-        host::DisplayMatrixOf,      host::OpenThumbnails,
+        host::DisplayMatrixOf,      host::OpenThumbnails,        host::AreCodedAlone,
     };
     return &library;
 }

@@ -81,4 +81,8 @@ std::unique_ptr<Thumbnails> OpenThumbnails(const std::filesystem::path& movie) {
     return Library().openThumbnails(movie);
 }
 
+bool AreCodedAlone(const std::filesystem::path& movie) {
+    return Library().areCodedAlone(movie);
+}
+
 }  // namespace host

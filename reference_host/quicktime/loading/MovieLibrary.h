@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "reference_host/quicktime/CodedAlone.h"
 #include "reference_host/quicktime/DisplayMatrix.h"
 #include "reference_host/quicktime/MovieComponents.h"
 #include "reference_host/quicktime/OpenProblem.h"
@@ -23,6 +24,7 @@ struct MovieLibrary {
     decltype(&RasterProblem) rasterProblem;
     decltype(&DisplayMatrixOf) displayMatrix;
     decltype(&OpenThumbnails) openThumbnails;
+    decltype(&AreCodedAlone) areCodedAlone;
 };
 
 // The one function that it exports, and its name.

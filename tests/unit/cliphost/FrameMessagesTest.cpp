@@ -26,7 +26,7 @@ bool IsTaken(const FrameAnswer& answer, const FrameRequest& request) {
 
 bool IsTakenAsPlan(std::uint64_t count, std::vector<std::uint64_t> cuts) {
     FrameAnswer answer;
-    answer.plan = {count, "", std::move(cuts)};
+    answer.plan = {count, 8, "", std::move(cuts)};
     return IsTaken(answer, Request(Kind::Plan, 1, 31));  // ten frames
 }
 
@@ -41,25 +41,31 @@ bool IsTakenAsPiece(const std::string& written, int status = kExitFine) {
 TEST(FrameMessages, ComeBackAsTheyWere) {
     FrameRequest request = Request(Kind::Pictures, 5, 80);
     request.wanted.isOne = true;
+    request.wanted.areBelieved = true;
     request.jobs = 7;
+    request.behind = 2;
     const FrameRequest asked = FrameRequest::From(request.ToBytes());
     EXPECT_EQ(asked.kind, Kind::Pictures);
     EXPECT_EQ(asked.wanted.range.first, 5u);
     EXPECT_EQ(asked.wanted.range.end, 80u);
     EXPECT_EQ(asked.wanted.range.step, 3u);
     EXPECT_TRUE(asked.wanted.isOne);
+    EXPECT_TRUE(asked.wanted.areBelieved);
     EXPECT_EQ(asked.jobs, 7u);
+    EXPECT_EQ(asked.behind, 2u);
     EXPECT_EQ(FrameRequest::From(Request(Kind::Plan, 1, {}).ToBytes()).wanted.range.CountIn(10),
               3u);
 
     FrameAnswer answer;
-    answer.plan = {20, "words", {5, 9}};
+    answer.plan = {20, 1000, "words", {5, 9}, true};
     answer.width = 64;
     answer.height = 48;
     FrameAnswer read;
     ASSERT_TRUE(read.Read(answer.ToBytes(), Request(Kind::Plan, 0, {})));
     EXPECT_EQ(read.plan.count, 20u);
+    EXPECT_EQ(read.plan.frameBytes, 1000u);
     EXPECT_EQ(read.plan.rawWords, "words");
+    EXPECT_TRUE(read.plan.isInOneGo);
     EXPECT_EQ(read.plan.cuts, (std::vector<std::uint64_t>{5, 9}));
     EXPECT_EQ(read.width, 64);
     EXPECT_EQ(read.height, 48);
@@ -88,9 +94,28 @@ TEST(FrameMessages, TellOfEachFrameOfThePiece) {
     EXPECT_FALSE(IsTakenAsPiece("wow", kExitFile));
 }
 
+TEST(FramePieces, AreFewWhateverAHeaderClaims) {
+    for (const std::uint64_t bytes : {0ull, 1ull, 1ull << 20, 1ull << 40}) {
+        const std::uint64_t claimed = std::uint64_t{1} << 40;
+        const PieceLength length = PieceLengthFor(claimed, bytes, 8);
+        EXPECT_LE(claimed / length.usual, 4096u);
+        EXPECT_GE(length.most, length.usual);
+        EXPECT_LE(length.most - length.usual, 4096u);
+    }
+    EXPECT_EQ(PieceLengthFor(96, 480 * 272 * 2, 2).usual, 13u);
+    EXPECT_EQ(PieceLengthFor(96, 480 * 272 * 2, 2).most, 49u);
+}
+
+TEST(FramePieces, WaitByTheirBytes) {
+    const std::uint64_t mebibyte = std::uint64_t{1} << 20;
+    EXPECT_EQ(MostPiecesWaiting(12, 1000, 8), 32u);
+    EXPECT_EQ(MostPiecesWaiting(128, mebibyte, 8), 16u);
+    EXPECT_EQ(MostPiecesWaiting(1024, mebibyte, 8), 8u) << "one for each process";
+}
+
 TEST(FrameMessages, AreNoneWhereAnyByteLacksOrIsTooMuch) {
     FrameAnswer answer;
-    answer.plan = {10, "words", {5}};
+    answer.plan = {10, 8, "words", {5}};
     const FrameRequest request = Request(Kind::Plan, 1, 31);
     const std::string bytes = answer.ToBytes();
     ASSERT_TRUE(FrameAnswer().Read(bytes, request));

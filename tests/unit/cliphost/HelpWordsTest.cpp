@@ -72,7 +72,8 @@ TEST_F(HelpWords, NameTheProgramAndItsVerbsButNotThoseThatAreHidden) {
 }
 
 TEST_F(HelpWords, TellWhatOptionsTake) {
-    for (const HelpOption& option : Help()[1].options) {
+    const HelpVerb show = Help()[1];
+    for (const HelpOption& option : show.options) {
         const bool isFiles = option.names[0] == "files";
         const bool isOutput = option.names[0] == "-o";
         EXPECT_EQ(option.isArgument, isFiles);

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 #include <unistd.h>
+#include <csignal>
 
 #include "reference_host/cliphost/Failure.h"
 #include "tests/unit/cliphost/TestFolder.h"
@@ -109,6 +110,7 @@ TEST(OutputFile, TellsThatTheReaderOfAPipeHasGone) {
     ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
     const int reader = open(pipe.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
     ASSERT_GE(reader, 0);
+    std::signal(SIGPIPE, SIG_IGN);  // as the program does
     OutputFile file(pipe);
     file.Write("x", 1);
     close(reader);

@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <fstream>
+#include <set>
 
 #include "reference_host/cliphost/Failure.h"
 #include "tests/support/TestFolder.h"
@@ -55,7 +56,7 @@ TEST_F(PrivateFiles, AreFilesOfTheirOwn) {
     OutputFile whole(folder() / "whole");
     for (const char* const name : {"link", "second name", "folder", "absent"}) {
         EXPECT_THROW(PutIntoPlace(folder() / name, place), Failure) << name;
-        EXPECT_THROW(AppendTo(whole, folder() / name, place), Failure) << name;
+        EXPECT_THROW(AppendTo(whole, folder() / name, 4, place), Failure) << name;
         EXPECT_EQ(Read(place), "old") << name;
     }
     EXPECT_EQ(Read(secret), "text");
@@ -65,12 +66,35 @@ TEST_F(PrivateFiles, AreFilesOfTheirOwn) {
 
 TEST_F(PrivateFiles, AreAppendedToOne) {
     OutputFile whole(folder() / "whole");
-    AppendTo(whole, Write("0", "first, "), folder() / "whole");
-    AppendTo(whole, Write("1", "second"), folder() / "whole");
+    AppendTo(whole, Write("0", "first, "), 7, folder() / "whole");
+    AppendTo(whole, Write("1", "second"), 6, folder() / "whole");
     whole.Finish();
     EXPECT_EQ(Read(folder() / "whole"), "first, second");
     EXPECT_FALSE(std::filesystem::exists(folder() / "0"));
     EXPECT_FALSE(std::filesystem::exists(folder() / "1"));
+}
+
+TEST_F(PrivateFiles, AreAppendedWholeOrNotAtAll) {
+    OutputFile whole(folder() / "whole");
+    for (const std::uint64_t bytes : {0, 5, 7}) {
+        EXPECT_THROW(AppendTo(whole, Write("0", "second"), bytes, folder() / "whole"), Failure);
+    }
+    whole.Finish();
+    EXPECT_EQ(Read(folder() / "whole"), "");
+    EXPECT_TRUE(IsOwnFile(folder() / "0", 6));
+    EXPECT_FALSE(IsOwnFile(folder() / "0", 5));
+}
+
+TEST_F(PrivateFiles, GoWithTheRequestTheyWereMadeFor) {
+    for (const char* const name : {"1", "1_30", "1_30.77.part", "12", "12_1", "0"}) {
+        Write(name, "x");
+    }
+    RemovePrivateFiles(folder(), 1);
+    std::set<std::string> left;
+    for (const auto& entry : std::filesystem::directory_iterator(folder())) {
+        left.insert(entry.path().filename());
+    }
+    EXPECT_EQ(left, (std::set<std::string>{"0", "12", "12_1"}));
 }
 
 TEST_F(PrivateFiles, AreCopiedFromAnotherFileSystem) {

@@ -266,6 +266,38 @@ TEST(Workers, GetAFolderEach) {
     EXPECT_FALSE(std::filesystem::exists(folder.parent_path()));
 }
 
+TEST(Workers, LeaveNothingOfWhatTheyWereAt) {
+    // The first process ends while it writes; the next one looks for what is left.
+    WorkerCall call;
+    call.program = "/bin/sh";
+    call.arguments = {"-c", Ready() + "n=$(head -c 25 <&3 | od -An -tu1 -j8 -N1)\n" +
+                                "own=${0#*=}\n" +
+                                "[ $n = 0 ] && { echo >\"$own/0_7.part\"; kill -SEGV $$; }\n" +
+                                "ls \"$own\"/../* >&2\n" + Answer("fine")};
+    call.writeNear = testing::TempDir();
+    Client client;
+    RunInWorkers(call, std::vector<std::string>(2, "x"), client);
+    ASSERT_EQ(client.results.size(), 2u);
+    EXPECT_NE(client.results[0].failure, "");
+    EXPECT_NE(client.results[1].told.find("/0"), std::string::npos) << "its folder";
+    EXPECT_EQ(client.results[1].told.find("0_7"), std::string::npos) << client.results[1].told;
+}
+
+TEST(Workers, AdviseOneJobOnlyWhereThereAreMore) {
+    for (const unsigned jobs : {1u, 2u}) {
+        WorkerCall call;
+        call.program = "/no/such/program";
+        call.jobs = jobs;
+        Client client;
+        try {
+            RunInWorkers(call, {"x", "x"}, client);
+            ADD_FAILURE() << "nothing was thrown";
+        } catch (const Failure& failure) {
+            EXPECT_EQ(failure.problem().hint.empty(), jobs == 1);
+        }
+    }
+}
+
 TEST(Workers, AreStartedByAParent) {
     EXPECT_FALSE(ServeAsWorker({}, [](std::uint64_t, const std::string&) { return ""; }));
 }

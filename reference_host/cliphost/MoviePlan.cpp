@@ -1,0 +1,235 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/MoviePlan.h"
+
+#include <fmt/format.h>
+
+#include <unordered_map>
+#include <unordered_set>
+
+#include "reference_host/cliphost/FolderTree.h"
+
+namespace cliphost {
+namespace {
+
+// "*.mov", or "*.mp4 or *.mxf".
+std::string NamesInWords(const std::vector<std::string>& endings) {
+    if (endings.empty()) {
+        return "*.mov";
+    }
+    std::string words;
+    for (std::size_t i = 0; i < endings.size(); ++i) {
+        words += (i == 0 ? "*." : i + 1 < endings.size() ? ", *." : " or *.") + endings[i];
+    }
+    return words;
+}
+
+}  // namespace
+
+class MoviePlanner {
+public:
+    MoviePlanner(Session& session, const MoviesOptions& options, const char* ending,
+                 MoviePlan& plan)
+        : session_(session),
+          options_(options),
+          ending_(ending),
+          plan_(plan),
+          hasNumbers_(!options.outFolder.empty() &&
+                      (options.skipDone || !options.shard.IsWhole())) {}
+
+    void Add(const std::filesystem::path& path) {
+        std::error_code ignored;
+        if (!std::filesystem::is_directory(path, ignored)) {
+            AppendMovie(path, path, MoviePlan::kNamed,
+                        [&] { return Keep(path.native(), plan_.named_); });
+        } else if (options_.isRecursive) {
+            AddTree(path);
+        } else {
+            AddFolder(path, false);
+        }
+    }
+
+private:
+    static std::uint32_t Keep(const std::string& path, PathList& paths) {
+        paths.Add(path);
+        return static_cast<std::uint32_t>(paths.size() - 1);
+    }
+
+    // `asGiven` does not depend on where the caller's working folder is mounted.
+    bool IsOfShare(const std::filesystem::path& asGiven) const {
+        return options_.shard.IsWhole() || options_.shard.Holds(asGiven.lexically_normal());
+    }
+
+    template <class Place>
+    void AppendMovie(const std::filesystem::path& movie, const std::filesystem::path& asGiven,
+                     std::uint32_t list, const Place& place) {
+        isEmpty_ = false;
+        const unsigned number = hasNumbers_ ? NextNumber(movie) : 0;
+        if (IsOfShare(asGiven)) {
+            plan_.steps_.push_back({list, place()});
+            AppendNumber(number);
+        }
+    }
+
+    void AppendOther(MovieStep step) {
+        isEmpty_ = isEmpty_ && step.notice;
+        if (IsOfShare(step.movie)) {
+            plan_.steps_.push_back(
+                {MoviePlan::kOther, static_cast<std::uint32_t>(plan_.others_.size())});
+            plan_.others_.push_back(std::move(step));
+            AppendNumber(0);
+        }
+    }
+
+    void AppendNumber(unsigned number) {
+        if (hasNumbers_) {
+            plan_.numbers_.push_back(number);
+        }
+    }
+
+    unsigned NextNumber(const std::filesystem::path& movie) {
+        unsigned& number = lastNumbers_[OutputName(movie, 1, ending_)];
+        while (!names_.insert(OutputName(movie, ++number, ending_)).second) {
+        }
+        return number;
+    }
+
+    void Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
+        MovieStep step{path.native()};
+        step.refusal = std::make_shared<const Failure>(status, problem);
+        AppendOther(std::move(step));
+    }
+
+    void Refuse(const std::vector<Problem>& problems) {
+        for (const Problem& problem : problems) {
+            Refuse(problem.subject, kExitCaller, problem);
+        }
+    }
+
+    void AddTree(const std::filesystem::path& root) {
+        isEmpty_ = true;
+        for (const std::filesystem::path& folder : FoldersIn(root)) {
+            AddFolder(folder, true);
+        }
+        if (isEmpty_) {
+            Refuse(root, kExitFile,
+                   {root, fmt::format("no file in it or in a folder within it is named {}",
+                                      NamesInWords(options_.endings))});
+        }
+    }
+
+    void AddFolder(const std::filesystem::path& folder, bool isOneOfMany) {
+        try {
+            if (!options_.endings.empty()) {
+                AddByEnding(folder, isOneOfMany);
+            } else if (IsClaimed(session_, PathForModule(folder).get())) {
+                AddClaimed(folder);
+            } else if (isOneOfMany) {
+                AddUnclaimed(folder);
+            } else {
+                throw Failure(kExitFile, NotClaimed(folder));
+            }
+        } catch (const Failure& failure) {
+            Refuse(folder, failure.status(), failure.problem());
+        }
+    }
+
+    void AddClaimed(const std::filesystem::path& folder) {
+        const auto clips = std::make_shared<FolderClips>(session_, folder);
+        for (const std::filesystem::path& name : clips->others().withBackslash) {
+            Refuse(name, kExitCaller, BackslashProblem(name));
+        }
+        Refuse(clips->others().noFiles);
+        TellLeftOut(folder, clips->others());
+        const auto list = static_cast<std::uint32_t>(plan_.folders_.size());
+        plan_.folders_.push_back(clips);
+        for (std::uint32_t place = 0; place < clips->clips().size(); ++place) {
+            const std::filesystem::path movie = clips->clips()[place].path;
+            AppendMovie(movie, folder / movie.filename(), list, [&] { return place; });
+        }
+    }
+
+    void AddUnclaimed(const std::filesystem::path& folder) {
+        const OtherMovies others = FindOtherMovies(folder);
+        Refuse(others.noFiles);
+        TellLeftOut(folder, others);
+    }
+
+    void TellLeftOut(const std::filesystem::path& folder, const OtherMovies& others) {
+        if (const Problem leftOut = LeftOut(folder, others)) {
+            MovieStep step{folder.native()};
+            step.notice = std::make_shared<const Problem>(leftOut);
+            AppendOther(std::move(step));
+        }
+    }
+
+    void AddByEnding(const std::filesystem::path& folder, bool isOneOfMany) {
+        const EndingMatches matches = FilesByEnding(folder, options_.endings);
+        Refuse(matches.noFiles);
+        for (const std::filesystem::path& file : matches.files) {
+            // The form of the paths that the module lists.
+            const auto movie = std::filesystem::absolute(file).lexically_normal();
+            AppendMovie(movie, file, MoviePlan::kFound,
+                        [&] { return Keep(movie.native(), plan_.found_); });
+        }
+        if (!isOneOfMany && matches.noFiles.empty() && matches.files.empty()) {
+            throw Failure(kExitFile, folder,
+                          "no file in it is named " + NamesInWords(options_.endings));
+        }
+    }
+
+    Session& session_;
+    const MoviesOptions& options_;
+    const char* const ending_;
+    MoviePlan& plan_;
+    const bool hasNumbers_;
+    std::unordered_set<std::string> names_;                  // of outputs
+    std::unordered_map<std::string, unsigned> lastNumbers_;  // by the name without one
+    bool isEmpty_ = true;  // the folder has neither a movie nor what is told as one
+};
+
+MoviePlan::MoviePlan(Session& session, const MoviesOptions& options, const char* ending) {
+    MoviePlanner planner(session, options, ending, *this);
+    for (const std::filesystem::path& path : options.paths) {
+        planner.Add(path);
+    }
+    if (!options.list.empty()) {
+        for (const auto& path : ReadInputList(options.list, options.listForm)) {
+            planner.Add(path);
+        }
+    }
+    named_.Close();
+    found_.Close();
+}
+
+MovieStep MoviePlan::operator[](std::size_t place) const {
+    const Planned& planned = steps_[place];
+    switch (planned.list) {
+        case kOther:
+            return others_[planned.place];
+        case kNamed:
+            return {named_[planned.place]};
+        case kFound:
+            return {found_[planned.place]};
+        default: {
+            const std::shared_ptr<FolderClips>& folder = folders_[planned.list];
+            FolderClip clip = folder->clips()[planned.place];
+            return {std::move(clip.path), folder, clip.index};
+        }
+    }
+}
+
+void MoviePlan::EndLists() {
+    for (const std::shared_ptr<FolderClips>& folder : folders_) {
+        folder->EndList();
+    }
+}
+
+std::filesystem::path OutputName(const std::filesystem::path& movie, unsigned number,
+                                 const char* ending) {
+    std::filesystem::path name = movie.stem();
+    name += number == 1 ? ending : fmt::format("-{}{}", number, ending);
+    return name;
+}
+
+}  // namespace cliphost
