@@ -5,7 +5,8 @@
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 
-// Classes and their properties, in the order of their ids.
+// Classes in the order of their ids, each with its properties in the order in which files number
+// them (stored/CreationOrder.h).
 namespace aaf {
 
 namespace {

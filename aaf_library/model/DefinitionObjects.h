@@ -34,7 +34,12 @@ public:
     HRESULT GetDescription(aafCharacter* description, aafUInt32 bufSize) override {
         return ReadString(prop::DefinitionObject_Description, description, bufSize);
     }
+    // Without a description there is nothing to read: 0.
     HRESULT GetDescriptionBufLen(aafUInt32* bufSize) override {
+        if (bufSize != nullptr && !IsPresent(prop::DefinitionObject_Description)) {
+            *bufSize = 0;
+            return AAFRESULT_SUCCESS;
+        }
         return ReadStringLength(prop::DefinitionObject_Description, bufSize);
     }
     HRESULT Initialize(aafUID_constref id, aafCharacter_constptr name) override;

@@ -42,6 +42,15 @@ const PropertyKey* SetFor(const GUID& classId) {
     return nullptr;
 }
 
+const PropertyKey* SetWithNumber(PropertyId pid) {
+    for (const DefinitionSet& entry : kSets) {
+        if (entry.set.pid == pid) {
+            return &entry.set;
+        }
+    }
+    return nullptr;
+}
+
 // The sets that a new dictionary offers something in.
 struct Offer {
     const GUID& classId;
@@ -76,12 +85,8 @@ Object* Dictionary::FindDefinition(const GUID& classId, const GUID& id) const {
 }
 
 Object* Dictionary::FindDefinition(PropertyId set, const GUID& id) const {
-    for (const DefinitionSet& entry : kSets) {
-        if (entry.set.pid == set) {
-            return Find(entry.set, id);
-        }
-    }
-    return nullptr;
+    const PropertyKey* key = SetWithNumber(set);
+    return key == nullptr ? nullptr : Find(*key, id);
 }
 
 Object* Dictionary::FindMade(const PropertyKey& set, const GUID& id) const {
@@ -140,7 +145,14 @@ void Dictionary::Complete() const {
 }
 
 HRESULT Dictionary::AddDefinition(const GUID& classId, Object* definition) {
-    const PropertyKey* set = SetFor(classId);
+    return AddTo(SetFor(classId), definition);
+}
+
+HRESULT Dictionary::AddDefinition(PropertyId set, Object* definition) {
+    return AddTo(SetWithNumber(set), definition);
+}
+
+HRESULT Dictionary::AddTo(const PropertyKey* set, Object* definition) {
     if (set == nullptr || definition == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }

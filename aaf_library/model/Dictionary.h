@@ -18,6 +18,7 @@ public:
     Object* FindDefinition(PropertyId set, const GUID& id) const;
     // Adds one of that class; its id must be new.
     HRESULT AddDefinition(const GUID& classId, Object* definition);
+    HRESULT AddDefinition(PropertyId set, Object* definition);
 
     // From now on the built-in data and container definitions are there; each comes into being
     // when it is looked up, all of them when the whole set is looked at.
@@ -99,6 +100,7 @@ private:
     // The element of a set with that id; a built-in one is made if it is not there yet.
     Object* Find(const PropertyKey& set, const GUID& id) const;
     Object* FindMade(const PropertyKey& set, const GUID& id) const;
+    HRESULT AddTo(const PropertyKey* set, Object* definition);
     void Make(const PropertyKey& set, const BuiltInDefinition& entry) const;
 
     template <class Interface>

@@ -92,7 +92,11 @@ HRESULT MetaDefinition::GetDescriptionBufLen(aafUInt32* bufSize) {
     if (bufSize == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    return described_ ? TextSize(description_, bufSize) : AAFRESULT_PROP_NOT_PRESENT;
+    if (!described_) {
+        *bufSize = 0;
+        return AAFRESULT_SUCCESS;
+    }
+    return TextSize(description_, bufSize);
 }
 
 }  // namespace aaf

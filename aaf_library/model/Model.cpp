@@ -231,18 +231,20 @@ bool Model::HasAsBuiltIn(const BuiltInClass& entry) const {
 
 bool Model::HasAsBuiltIn(const BuiltInType& entry) const {
     const auto found = typeById_.find(entry.id);
-    return found == typeById_.end() || (found->second->IsBuiltIn() && !found->second->IsRenamed() &&
-                                        MembersOf(*found->second) == FactsOf(entry).members);
+    if (found == typeById_.end()) {
+        return true;
+    }
+    const TypeDefinition& type = *found->second;
+    return type.IsBuiltIn() && !type.IsRenamed() &&
+           (type.element() == nullptr || type.element()->id() == entry.target) &&
+           MembersOf(type) == FactsOf(entry).members;
 }
 
 HRESULT Model::RegisterClass(ClassDefinition& definition) {
     if (!definition.IsInitialized()) {
         return AAFRESULT_NOT_INITIALIZED;
     }
-    if (definition.IsRegistered()) {
-        return AAFRESULT_OBJECT_ALREADY_ATTACHED;
-    }
-    if (FindClass(definition.id()) != nullptr) {
+    if (definition.IsRegistered() || FindClass(definition.id()) != nullptr) {
         return AAFRESULT_SUCCESS;
     }
     Enter(RefPtr<ClassDefinition>(&definition));

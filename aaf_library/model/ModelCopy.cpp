@@ -67,6 +67,16 @@ PropertyDefinition* Model::PropertyLike(ClassDefinition& owner, const PropertyDe
 }
 
 void Model::CopyReferredTo(const PropertyValue& value) {
+    if (value.asStored()) {
+        for (const auto& [set, id] : value.asStored()->targets) {
+            const Object* const definition = value.model()->dictionary().FindDefinition(set, id);
+            if (definition != nullptr && dictionary_->FindDefinition(set, id) == nullptr) {
+                const RefPtr<Object> copy = CopyObject(*definition);
+                dictionary_->AddDefinition(set, copy.get());
+            }
+        }
+        return;
+    }
     GUID actual{};
     const TypeDefinition& type = value.type();
     const TypeKind kind = type.Resolved().kind();
@@ -105,6 +115,7 @@ HRESULT Model::CopyValue(const PropertyValue& source, Object& target,
     CopyReferredTo(source);
     value->BytesToChange() = source.bytes();
     value->SetStreamByteOrder(source.streamByteOrder());
+    value->KeepAsStored(source.asStored());
     for (const RefPtr<Object>& object : source.objects()) {
         const RefPtr<Object> copy = CopyObject(*object);
         if (!copy) {

@@ -35,11 +35,12 @@ PropertyId Object::NumberOf(const PropertyKey& key) const {
 }
 
 PropertyValue* Object::FindValue(const PropertyKey& key) const {
-    return values().Find(NumberOf(key));
+    PropertyValue* const value = values().Find(NumberOf(key));
+    return value == nullptr || value->asStored() ? nullptr : value;
 }
 
 HRESULT Object::RemoveValue(const PropertyKey& key) {
-    if (FindValue(key) == nullptr) {
+    if (values().Find(NumberOf(key)) == nullptr) {
         return AAFRESULT_PROP_NOT_PRESENT;
     }
     model()->TellChange();
@@ -59,7 +60,9 @@ PropertyValue* Object::RequireValue(const PropertyKey& key) {
     RefPtr<PropertyValue> value = property->type()->NewValue();
     value->EnterObject(*this);
     PropertyValue* added = value.get();
-    values_.Put(property->pid(), std::move(value));
+    if (const RefPtr<PropertyValue> old = values_.Put(property->pid(), std::move(value))) {
+        old->LeaveObject();  // one that is kept as stored
+    }
     return added;
 }
 
@@ -79,6 +82,7 @@ HRESULT Object::PutValue(PropertyId pid, PropertyValue* value) {
         entering = value->type().NewValue();
         entering->BytesToChange() = value->bytes();
         entering->SetStreamByteOrder(value->streamByteOrder());
+        entering->KeepAsStored(value->asStored());
     }
     const HRESULT result = entering->EnterObject(*this);
     if (result < 0) {

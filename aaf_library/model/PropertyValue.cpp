@@ -150,7 +150,7 @@ HRESULT PropertyValue::IsDefinedType(aafBoolean_t* isDefined) {
     if (isDefined == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    *isDefined = kAAFTrue;
+    *isDefined = asStored_ == nullptr ? kAAFTrue : kAAFFalse;
     return AAFRESULT_SUCCESS;
 }
 

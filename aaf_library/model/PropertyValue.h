@@ -3,6 +3,8 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
+#include <utility>
 #include <vector>
 
 #include "aaf_library/model/PropertyKey.h"
@@ -16,6 +18,15 @@ class Object;
 class TypeDefinition;
 
 using Bytes = std::vector<std::uint8_t>;
+
+// What a file holds in place of a value: kept for the next file that is written. Those who read
+// and write files know more of it.
+struct AsStored {
+    virtual ~AsStored() = default;
+
+    // The definitions that it refers to, by the dictionary's property and their id.
+    std::vector<std::pair<PropertyId, GUID>> targets;
+};
 
 // A value of some type. What it holds follows from the form of its type:
 //   data           bytes, in stored form (little-endian, packed, UTF-16 text)
@@ -55,6 +66,11 @@ public:
     HRESULT EnterObject(Object& holder);
     void LeaveObject();
 
+    // Set when a file held something that is no value of its property. Then the bytes are what can
+    // be shown of it, and the property counts as absent but for those who ask for its value.
+    const std::shared_ptr<const AsStored>& asStored() const { return asStored_; }
+    void KeepAsStored(std::shared_ptr<const AsStored> asStored) { asStored_ = std::move(asStored); }
+
     // Read and write position of a stream value.
     std::uint64_t position() const { return position_; }
     void SetPosition(std::uint64_t position) { position_ = position; }
@@ -64,6 +80,7 @@ public:
 
     // -- IAAFPropertyValue
     HRESULT GetType(IAAFTypeDef** typeDef) override;
+    // No for a value that is kept as stored; its type then is one of bytes.
     HRESULT IsDefinedType(aafBoolean_t* isDefined) override;
 
 private:
@@ -76,6 +93,7 @@ private:
     Bytes bytes_;
     std::vector<RefPtr<Object>> objects_;
     Object* holder_ = nullptr;
+    std::shared_ptr<const AsStored> asStored_;
     std::uint64_t position_ = 0;
     std::uint8_t streamByteOrder_ = 0x55;
 };

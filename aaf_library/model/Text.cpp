@@ -100,6 +100,15 @@ std::wstring TextOfStored(const Bytes& bytes) {
     return text;
 }
 
+bool IsSameElementName(const std::wstring& left, const std::wstring& right) {
+    const std::wstring prefix = L"kAAF";
+    const auto startOf = [&](const std::wstring& name) {
+        return name.compare(0, prefix.size(), prefix) == 0 ? prefix.size() : 0;
+    };
+    return left.compare(startOf(left), std::wstring::npos, right, startOf(right),
+                        std::wstring::npos) == 0;
+}
+
 std::wstring Widen(const char* ascii) {
     return {ascii, ascii + std::strlen(ascii)};
 }

@@ -25,6 +25,10 @@ Bytes StoredText(const std::wstring& text);
 // Text up to the first zero, if there is one.
 std::wstring TextOfStored(const Bytes& bytes);
 
+// Whether two names of an enumeration's elements mean the same: files have them without the prefix
+// "kAAF" that they have in programs.
+bool IsSameElementName(const std::wstring& left, const std::wstring& right);
+
 // Text of one of the constant tables, which are plain ASCII.
 std::wstring Widen(const char* ascii);
 

@@ -20,6 +20,12 @@ HRESULT TypeEnumeration::Setup(const GUID& id, const std::wstring& name, TypeDef
     return result;
 }
 
+void TypeEnumeration::Redefine(TypeDefinition& element, TypeMembers members) {
+    element_ = &element;
+    model()->KeepType(element);
+    members_ = std::move(members);
+}
+
 bool TypeEnumeration::IsSignedElement() const {
     return static_cast<const TypeInteger&>(element_->Resolved()).IsSignedType();
 }
@@ -79,7 +85,7 @@ HRESULT TypeEnumeration::CreateValueFromName(aafCharacter_constptr name,
         return AAFRESULT_NOT_INITIALIZED;
     }
     for (const Member& member : members_) {
-        if (member.name == name) {
+        if (IsSameElementName(member.name, name)) {
             Bytes stored;
             AppendNumber(static_cast<std::uint64_t>(member.value), StoredSize(), stored);
             return GiveValue(*this, std::move(stored), propVal);

@@ -18,6 +18,8 @@ public:
     HRESULT Setup(const GUID& id, const std::wstring& name, TypeDefinition& element,
                   TypeMembers members);
     const TypeMembers& members() const { return members_; }
+    // Another file says more of it. The element type must be an integer.
+    void Redefine(TypeDefinition& element, TypeMembers members);
 
     TypeDefinition* element() const override { return element_; }
     std::size_t StoredSize() const override;

@@ -40,7 +40,7 @@ HRESULT TypeExtendibleEnumeration::CreateValueFromName(aafCharacter_constptr nam
         return AAFRESULT_NULL_PARAM;
     }
     for (const Member& member : members_) {
-        if (member.name == name) {
+        if (IsSameElementName(member.name, name)) {
             Bytes stored;
             AppendGuid(member.id, stored);
             return GiveValue(*this, std::move(stored), propVal);

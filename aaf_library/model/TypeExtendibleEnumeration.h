@@ -18,6 +18,7 @@ public:
 
     HRESULT Setup(const GUID& id, const std::wstring& name, TypeMembers members);
     const TypeMembers& members() const { return members_; }
+    void Redefine(TypeMembers members) { members_ = std::move(members); }
 
     std::size_t StoredSize() const override { return sizeof(GUID); }
     std::size_t NativeSize() const override { return sizeof(GUID); }

@@ -212,6 +212,69 @@ RefPtr<TypeDefinition> MakeType(Model& model, const TypeFacts& facts) {
     return Setup(*type, model, facts) < 0 ? nullptr : type;
 }
 
+namespace {
+
+// Whether a type is a rename of the other, however many stand between.
+bool LeadsTo(const TypeDefinition& type, const TypeDefinition& other) {
+    const TypeDefinition* at = &type;
+    while (at != &other && at->kind() == TypeKind::Rename && at->element() != nullptr) {
+        at = at->element();
+    }
+    return at == &other;
+}
+
+// What a file lists, and behind it what we know besides.
+TypeMembers Joined(const TypeMembers& listed, const TypeMembers& known) {
+    std::vector<TypeMember> joined(listed.begin(), listed.end());
+    for (const TypeMember& member : known) {
+        const bool mentioned =
+            std::any_of(listed.begin(), listed.end(), [&](const TypeMember& other) {
+                return other.name == member.name ||
+                       (other.id == member.id && other.value == member.value);
+            });
+        if (!mentioned) {
+            joined.push_back(member);
+        }
+    }
+    // The same in another order says nothing new.
+    return joined.size() == known.size() &&
+                   std::is_permutation(joined.begin(), joined.end(), known.begin())
+               ? known
+               : TypeMembers(std::move(joined));
+}
+
+}  // namespace
+
+bool Redefine(TypeDefinition& type, Model& model, const TypeFacts& facts) {
+    if (type.kind() != facts.kind) {
+        return false;
+    }
+    if (!facts.name.empty() && facts.name != type.name()) {
+        type.SetName(facts.name.c_str());
+    }
+    TypeDefinition* const target =
+        RefersToClass(facts.kind) ? nullptr : model.FindType(facts.target);
+    const bool sameKind = target != nullptr && type.element() != nullptr &&
+                          target->Resolved().kind() == type.element()->Resolved().kind();
+    switch (facts.kind) {
+        case TypeKind::Enumeration:
+            static_cast<TypeEnumeration&>(type).Redefine(sameKind ? *target : *type.element(),
+                                                         Joined(facts.members, MembersOf(type)));
+            return true;
+        case TypeKind::ExtendibleEnumeration:
+            static_cast<TypeExtendibleEnumeration&>(type).Redefine(
+                Joined(facts.members, MembersOf(type)));
+            return true;
+        case TypeKind::Rename:
+            if (sameKind && !LeadsTo(*target, type)) {
+                static_cast<TypeRename&>(type).Redefine(*target);
+            }
+            return true;
+        default:
+            return true;
+    }
+}
+
 RefPtr<TypeDefinition> MakeBuiltInType(Model& model, const BuiltInType& entry) {
     RefPtr<TypeDefinition> type = MakeType(model, FactsOf(entry));
     type->MarkBuiltIn();

@@ -43,6 +43,10 @@ eAAFTypeCategory_t CategoryOf(TypeKind kind);
 RefPtr<TypeDefinition> MakeType(Model& model, TypeKind kind);
 // A free type with these facts; null when the model lacks a type that they name.
 RefPtr<TypeDefinition> MakeType(Model& model, const TypeFacts& facts);
+// Makes a type say what the facts of the same id say: its name, the members of an enumeration in
+// front of those that they don't mention, the type that is renamed. False when they say something
+// that a type can't change: that it is of another kind.
+bool Redefine(TypeDefinition& type, Model& model, const TypeFacts& facts);
 // The definition of a built-in type, free; makes those that it is built of in the model.
 RefPtr<TypeDefinition> MakeBuiltInType(Model& model, const BuiltInType& entry);
 

@@ -315,10 +315,16 @@ HRESULT TypeRecord::RegisterMembers(aafUInt32* offsets, aafUInt32 numMembers,
     if (numMembers != members_.size()) {
         return AAFRESULT_ILLEGAL_VALUE;
     }
+    // What a member takes has to be known first.
+    for (const TypeDefinition* type : types_) {
+        if (type->NativeSize() == 0) {
+            return AAFRESULT_NOT_REGISTERED;
+        }
+    }
     // A member that reaches beyond the structure would touch memory of others.
     for (std::size_t i = 0; i < members_.size(); ++i) {
         const std::size_t size = types_[i]->NativeSize();
-        if (size == 0 || size > structSize || offsets[i] > structSize - size) {
+        if (size > structSize || offsets[i] > structSize - size) {
             return AAFRESULT_ILLEGAL_VALUE;
         }
     }

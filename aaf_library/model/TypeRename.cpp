@@ -15,6 +15,11 @@ HRESULT TypeRename::Setup(const GUID& id, const std::wstring& name, TypeDefiniti
     return result;
 }
 
+void TypeRename::Redefine(TypeDefinition& base) {
+    base_ = &base;
+    model()->KeepType(base);
+}
+
 void TypeRename::AppendStored(const std::uint8_t* native, Bytes& out) const {
     base_->AppendStored(native, out);
 }

@@ -13,6 +13,8 @@ public:
     TypeRename() : Implements(TypeKind::Rename) {}
 
     HRESULT Setup(const GUID& id, const std::wstring& name, TypeDefinition& base);
+    // Another file names another type, of the same kind.
+    void Redefine(TypeDefinition& base);
 
     ValueForm form() const override { return base_ == nullptr ? ValueForm::Data : base_->form(); }
     TypeDefinition* element() const override { return base_; }

@@ -40,6 +40,9 @@ constexpr FailureCode kFailureCodes[] = {
 };
 
 HRESULT ResultOf(const stored::FileResult& result, HRESULT noAccess) {
+    for (const std::string& note : result.notes) {
+        TellDiagnostic(note);
+    }
     if (result) {
         return AAFRESULT_SUCCESS;
     }
@@ -276,8 +279,15 @@ HRESULT File::SaveCopyAs(IAAFFile* destFile) {
 
 HRESULT File::CopyContentTo(File& target) {
     HRESULT result = CopyExtensions(*model_, *target.model_);
+    const aafUInt32 own = target.header_->IdentificationCount();
+    if (result >= 0) {
+        result = target.header_->AddIdentificationsOf(*header_);
+    }
     if (result >= 0) {
         result = target.TakeMobs(*header_->content());
+    }
+    if (result < 0) {
+        target.header_->KeepIdentifications(own);
     }
     aafUID_t pattern{};
     if (result >= 0 && header_->GetOperationalPattern(&pattern) >= 0) {
@@ -318,9 +328,12 @@ bool File::SaveContentAs(File& target) {
         target.header_->SetOperationalPattern(pattern);
     }
     target.header_->Touch();
-    if (!stored::SaveModel(*target.model_, *target.header_, target.path_, target.SizeOfSectors(),
+    const aafUInt32 own = target.header_->IdentificationCount();
+    if (target.header_->AddIdentificationsOf(*header_) < 0 ||
+        !stored::SaveModel(*target.model_, *target.header_, target.path_, target.SizeOfSectors(),
                            header_->content())) {
         target.header_->RemoveValue(prop::Header_OperationalPattern);
+        target.header_->KeepIdentifications(own);
         return false;
     }
     TellProgress();

@@ -46,6 +46,28 @@ HRESULT Header::AddIdentification(const aafProductIdentification_t& product) {
                       : AppendObject(prop::Header_IdentificationList, identification->Identity());
 }
 
+HRESULT Header::AddIdentificationsOf(const Header& other) {
+    const aafUInt32 own = IdentificationCount();
+    for (aafUInt32 at = 0; at < other.IdentificationCount(); ++at) {
+        const RefPtr<Object> copy =
+            model()->CopyObject(*other.ObjectAt(prop::Header_IdentificationList, at));
+        const HRESULT result = copy
+                                   ? AppendObject(prop::Header_IdentificationList, copy->Identity())
+                                   : AAFRESULT_INVALID_OBJ;
+        if (result < 0) {
+            KeepIdentifications(own);
+            return result;
+        }
+    }
+    return AAFRESULT_SUCCESS;
+}
+
+void Header::KeepIdentifications(aafUInt32 count) {
+    while (IdentificationCount() > count) {
+        RemoveObjectAt(prop::Header_IdentificationList, IdentificationCount() - 1);
+    }
+}
+
 void Header::Touch() {
     PutStruct(prop::Header_LastModified, CurrentTime());
 }

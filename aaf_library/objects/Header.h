@@ -27,6 +27,11 @@ public:
     ContentStorage* content() const;
     // Appends an identification of the program that is about to write.
     HRESULT AddIdentification(const aafProductIdentification_t& product);
+    // Puts copies of those of another file behind this one's.
+    HRESULT AddIdentificationsOf(const Header& other);
+    aafUInt32 IdentificationCount() const { return CountObjects(prop::Header_IdentificationList); }
+    // Drops those behind the first ones.
+    void KeepIdentifications(aafUInt32 count);
     // To be called when the file is saved.
     void Touch();
 

@@ -51,7 +51,8 @@ HRESULT Identification::Initialize(aafCharacter_constptr companyName,
 }
 
 HRESULT Identification::GetGenerationID(aafUID_t* generation) {
-    return ReadStruct(prop::Identification_GenerationAUID, generation);
+    return IsInitialized() ? ReadStruct(prop::Identification_GenerationAUID, generation)
+                           : AAFRESULT_NOT_INITIALIZED;
 }
 
 }  // namespace aaf

@@ -10,7 +10,7 @@
 namespace aaf {
 
 // A program that wrote the file, with the time and a generation id of its own.
-// Owned by the header's list.
+// Owned by the header's list. Its getters need Initialize.
 class Identification : public Implements<Object, IAAFIdentification> {
 public:
     // All that a caller of the open functions tells. Company and product name
@@ -21,46 +21,67 @@ public:
                        aafCharacter_constptr productVersionString,
                        aafUID_constref productID) override;
     HRESULT GetCompanyName(aafCharacter* companyName, aafUInt32 bufSize) override {
-        return ReadString(prop::Identification_CompanyName, companyName, bufSize);
+        return IsInitialized() ? ReadString(prop::Identification_CompanyName, companyName, bufSize)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetCompanyNameBufLen(aafUInt32* bufSize) override {
-        return ReadStringLength(prop::Identification_CompanyName, bufSize);
+        return IsInitialized() ? ReadStringLength(prop::Identification_CompanyName, bufSize)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetProductName(aafCharacter* productName, aafUInt32 bufSize) override {
-        return ReadString(prop::Identification_ProductName, productName, bufSize);
+        return IsInitialized() ? ReadString(prop::Identification_ProductName, productName, bufSize)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetProductNameBufLen(aafUInt32* bufSize) override {
-        return ReadStringLength(prop::Identification_ProductName, bufSize);
+        return IsInitialized() ? ReadStringLength(prop::Identification_ProductName, bufSize)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetProductVersionString(aafCharacter* productVersionString,
                                     aafUInt32 bufSize) override {
-        return ReadString(prop::Identification_ProductVersionString, productVersionString, bufSize);
+        return IsInitialized() ? ReadString(prop::Identification_ProductVersionString,
+                                            productVersionString, bufSize)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetProductVersionStringBufLen(aafUInt32* bufSize) override {
-        return ReadStringLength(prop::Identification_ProductVersionString, bufSize);
+        return IsInitialized()
+                   ? ReadStringLength(prop::Identification_ProductVersionString, bufSize)
+                   : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetProductVersion(aafProductVersion_t* version) override {
-        return ReadStruct(prop::Identification_ProductVersion, version);
+        return IsInitialized() ? ReadStruct(prop::Identification_ProductVersion, version)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT SetProductVersion(aafProductVersion_constref version) override {
         return PutStruct(prop::Identification_ProductVersion, version);
     }
     HRESULT GetProductID(aafUID_t* productID) override {
-        return ReadStruct(prop::Identification_ProductID, productID);
+        return IsInitialized() ? ReadStruct(prop::Identification_ProductID, productID)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetDate(aafTimeStamp_t* timestamp) override {
-        return ReadStruct(prop::Identification_Date, timestamp);
+        return IsInitialized() ? ReadStruct(prop::Identification_Date, timestamp)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetRefImplVersion(aafProductVersion_t* version) override {
-        return ReadStruct(prop::Identification_ToolkitVersion, version);
+        return IsInitialized() ? ReadStruct(prop::Identification_ToolkitVersion, version)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetPlatform(aafCharacter* platform, aafUInt32 bufSize) override {
-        return ReadString(prop::Identification_Platform, platform, bufSize);
+        return IsInitialized() ? ReadString(prop::Identification_Platform, platform, bufSize)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetPlatformBufLen(aafUInt32* bufSize) override {
-        return ReadStringLength(prop::Identification_Platform, bufSize);
+        return IsInitialized() ? ReadStringLength(prop::Identification_Platform, bufSize)
+                               : AAFRESULT_NOT_INITIALIZED;
     }
     HRESULT GetGenerationID(aafUID_t* generation) override;
+
+private:
+    // Files may lack one of these.
+    bool IsInitialized() const {
+        return IsPresent(prop::Identification_GenerationAUID) ||
+               IsPresent(prop::Identification_CompanyName);
+    }
 };
 
 }  // namespace aaf

@@ -22,6 +22,8 @@ namespace aaf {
 
 class MobSlot;
 
+class Component;
+
 // A piece of material under an id of its own, with its slots and comments.
 // Owned by the content storage of a file, or free.
 class Mob : public Implements<Object, IAAFMob, IAAFMob2> {
@@ -150,11 +152,17 @@ protected:
     // A free source clip.
     HRESULT MakeSourceClip(IAAFDataDef* essenceKind, const aafSourceRef_t& reference,
                            aafLength_t length, RefPtr<Object>& clip);
+    // Puts a component at the end of the sequence in the slot with that id; both come into being
+    // where they are missing.
+    HRESULT AppendToSequence(aafRational_t editRate, aafSlotID_t slotId, Component& component,
+                             const wchar_t* name);
     // A timeline slot at the end with a segment that nobody owns yet.
     HRESULT AppendTimelineSlot(aafRational_t editRate, Object& segment, aafSlotID_t slotId,
                                const wchar_t* name);
 
 private:
+    HRESULT MakeSequence(Component& component, RefPtr<Object>& sequence);
+
     // Where the first slot of each id stands, for the slots that were looked at so far. A mob may
     // have tens of thousands, one for each channel of a sound track.
     mutable std::unordered_map<aafSlotID_t, aafUInt32> slotPlaces_;

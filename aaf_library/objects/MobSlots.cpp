@@ -102,6 +102,33 @@ HRESULT Mob::PutSourceClip(aafRational_t editRate, aafSlotID_t slotId, IAAFDataD
     return AppendTimelineSlot(editRate, *clip, slotId, L"ASlot");
 }
 
+HRESULT Mob::MakeSequence(Component& component, RefPtr<Object>& sequence) {
+    const RefPtr<Sequence> made = model()->NewObject<Sequence>(AUID_AAFSequence);
+    Unknown* const kind = component.WeakTarget(prop::Component_DataDefinition);
+    const HRESULT result = kind == nullptr
+                               ? AAFRESULT_OBJECT_NOT_FOUND
+                               : made->PutWeak(prop::Component_DataDefinition, kind->Identity());
+    sequence = made;
+    return result < 0 ? result : made->InsertComponentAt(0, &component);
+}
+
+HRESULT Mob::AppendToSequence(aafRational_t editRate, aafSlotID_t slotId, Component& component,
+                              const wchar_t* name) {
+    MobSlot* const slot = FindSlot(slotId);
+    if (slot != nullptr && slot->segment() != nullptr) {
+        Sequence* const present = dynamic_cast<Sequence*>(slot->segment());
+        return present == nullptr ? AAFRESULT_OBJECT_ALREADY_ATTACHED
+                                  : present->AppendComponent(&component);
+    }
+    RefPtr<Object> sequence;
+    const HRESULT result = MakeSequence(component, sequence);
+    if (result < 0) {
+        return result;
+    }
+    return slot != nullptr ? slot->PutObject(prop::MobSlot_Segment, sequence->Identity())
+                           : AppendTimelineSlot(editRate, *sequence, slotId, name);
+}
+
 HRESULT Mob::AppendSourceClip(aafRational_t editRate, aafSlotID_t slotId, IAAFDataDef* essenceKind,
                               const aafSourceRef_t& reference, aafLength_t length) {
     MobSlot* const slot = FindSlot(slotId);

@@ -7,12 +7,45 @@
 
 namespace aaf {
 
-// Sound as plain samples. Its own operations need Initialize, which takes the
-// sound's values back to their defaults; those of its base classes do not.
+// Sound as plain samples. Its own operations and the setters of any sound need Initialize, which
+// takes the sound's values back to their defaults.
 class PCMDescriptor : public Implements<SoundDescriptor, IAAFPCMDescriptor> {
 public:
     HRESULT Initialize() override;
 
+    // -- IAAFSoundDescriptor
+    HRESULT SetCompression(aafUID_constref compression) override {
+        return IsInitialized() ? SoundDescriptor::SetCompression(compression)
+                               : AAFRESULT_NOT_INITIALIZED;
+    }
+    HRESULT SetChannelCount(aafUInt32 count) override {
+        return IsInitialized() ? SoundDescriptor::SetChannelCount(count)
+                               : AAFRESULT_NOT_INITIALIZED;
+    }
+    HRESULT SetAudioSamplingRate(aafRational_t rate) override {
+        return IsInitialized() ? SoundDescriptor::SetAudioSamplingRate(rate)
+                               : AAFRESULT_NOT_INITIALIZED;
+    }
+    HRESULT SetIsLocked(aafBoolean_t locked) override {
+        return IsInitialized() ? SoundDescriptor::SetIsLocked(locked) : AAFRESULT_NOT_INITIALIZED;
+    }
+    HRESULT SetElectroSpatialFormulation(aafElectroSpatialFormulation_t formulation) override {
+        return IsInitialized() ? SoundDescriptor::SetElectroSpatialFormulation(formulation)
+                               : AAFRESULT_NOT_INITIALIZED;
+    }
+    HRESULT SetAudioRefLevel(aafInt8 level) override {
+        return IsInitialized() ? SoundDescriptor::SetAudioRefLevel(level)
+                               : AAFRESULT_NOT_INITIALIZED;
+    }
+    HRESULT SetDialNorm(aafInt8 dialNorm) override {
+        return IsInitialized() ? SoundDescriptor::SetDialNorm(dialNorm) : AAFRESULT_NOT_INITIALIZED;
+    }
+    HRESULT SetQuantizationBits(aafUInt32 bitsCount) override {
+        return IsInitialized() ? SoundDescriptor::SetQuantizationBits(bitsCount)
+                               : AAFRESULT_NOT_INITIALIZED;
+    }
+
+    // -- IAAFPCMDescriptor
     HRESULT SetBlockAlign(aafUInt16 blockAlign) override {
         return IsInitialized() ? PutInteger(prop::PCMDescriptor_BlockAlign, blockAlign)
                                : AAFRESULT_NOT_INITIALIZED;

@@ -138,7 +138,8 @@ HRESULT Sequence::InsertComponentAt(aafUInt32 index, IAAFComponent* component) {
     if (result < 0) {
         return result;
     }
-    if (!added->IsPresent(prop::Component_Length)) {
+    const bool hasLength = added->IsPresent(prop::Component_Length);
+    if (!hasLength && !IsEvent(added)) {
         return AAFRESULT_PROP_NOT_PRESENT;
     }
     aafLength_t sum = 0;
@@ -146,13 +147,16 @@ HRESULT Sequence::InsertComponentAt(aafUInt32 index, IAAFComponent* component) {
         return AAFRESULT_BAD_LENGTH;
     }
     result = InsertObjectAt(prop::Sequence_Components, index, component);
-    return result < 0 ? result : PutInteger(prop::Component_Length, sum);
+    return result < 0 || !hasLength ? result : PutInteger(prop::Component_Length, sum);
 }
 
 HRESULT Sequence::RemoveComponentAt(aafUInt32 index) {
     const Component* const removed = ComponentAt(index);
     if (removed == nullptr) {
         return AAFRESULT_BADINDEX;
+    }
+    if (!removed->IsPresent(prop::Component_Length)) {
+        return RemoveObjectAt(prop::Sequence_Components, index);
     }
     aafLength_t rest = 0;
     if (!SubtractLength(LengthOf(*this), *removed, rest)) {

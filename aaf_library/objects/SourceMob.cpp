@@ -53,8 +53,8 @@ HRESULT SourceMob::AppendTimecodeSlot(aafRational_t editrate, aafInt32 slotID,
     const RefPtr<Timecode> timecode = model()->NewObject<Timecode>(AUID_AAFTimecode);
     const HRESULT result = timecode->Initialize(length32, &startTC);
     return result < 0 ? result
-                      : AppendTimelineSlot(editrate, *timecode, static_cast<aafSlotID_t>(slotID),
-                                           L"Timecode");
+                      : AppendToSequence(editrate, static_cast<aafSlotID_t>(slotID), *timecode,
+                                         L"Timecode");
 }
 
 HRESULT SourceMob::AppendEdgecodeSlot(aafRational_t editrate, aafInt32 slotID,
@@ -73,8 +73,8 @@ HRESULT SourceMob::AppendEdgecodeSlot(aafRational_t editrate, aafInt32 slotID,
     const RefPtr<Edgecode> edgecode = model()->NewObject<Edgecode>(AUID_AAFEdgecode);
     const HRESULT result = edgecode->Initialize(length32, code);
     return result < 0 ? result
-                      : AppendTimelineSlot(editrate, *edgecode, static_cast<aafSlotID_t>(slotID),
-                                           L"Edgecode");
+                      : AppendToSequence(editrate, static_cast<aafSlotID_t>(slotID), *edgecode,
+                                         L"Edgecode");
 }
 
 HRESULT SourceMob::NewPhysSourceRef(aafRational_t editrate, aafSlotID_t aMobSlot,

@@ -49,6 +49,14 @@ bool IsNew(const Entry* entry, Span<Entry> table, std::vector<bool>& metEntries,
     return isNew;
 }
 
+// Whether a built-in enumeration lists more than the built-in model.
+bool HasOwnMembers(const TypeDefinition& type) {
+    const bool isEnumeration =
+        type.kind() == TypeKind::Enumeration || type.kind() == TypeKind::ExtendibleEnumeration;
+    const BuiltInType* const entry = isEnumeration ? FindBuiltInType(type.id()) : nullptr;
+    return entry != nullptr && !(MembersOf(type) == FactsOf(*entry).members);
+}
+
 }  // namespace
 
 void MetaClosure::AddClass(const GUID& id) {
@@ -80,7 +88,7 @@ void MetaClosure::AddExtensions() {
     }
     for (std::size_t i = 0; i < model_.madeTypes().size(); ++i) {
         const RefPtr<TypeDefinition> type = model_.madeTypes()[i];
-        if (!type->IsBuiltIn()) {
+        if (!type->IsBuiltIn() || HasOwnMembers(*type)) {
             AddType(type->id());
         }
     }

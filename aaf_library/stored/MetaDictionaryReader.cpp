@@ -12,7 +12,8 @@ namespace {
 
 const StoredProperty* FindIn(const StoredObject& object, std::uint16_t pid, StoredForm form) {
     const StoredProperty* property = object.Find(pid);
-    return property != nullptr && property->form == form ? property : nullptr;
+    const bool fits = property != nullptr && property->form == form && property->problem.empty();
+    return fits ? property : nullptr;
 }
 
 const Bytes& RequiredData(const StoredObject& object, std::uint16_t pid) {
@@ -178,15 +179,29 @@ MetaProperty ReadProperty(const StoredObject& object) {
     return record;
 }
 
-MetaClass ReadClass(const StoredObject& object) {
+// What an object says, added to a list; or a note that it says nothing.
+template <class Record, class Read>
+void ReadInto(std::vector<Record>& records, std::vector<std::string>& notes, const char* what,
+              const Read& read) {
+    try {
+        records.push_back(read());
+    } catch (const StoredError& problem) {
+        notes.push_back(std::string("meta-dictionary: ") + what +
+                        " is left out: " + problem.what());
+    }
+}
+
+MetaClass ReadClass(const StoredObject& object, std::vector<std::string>& notes) {
     MetaClass record;
     record.id = GuidOf(RequiredData(object, meta::kIdentification));
     record.name = NameOf(object);
     record.parent = RequiredTarget(object, meta::kParentClass);
     record.concrete = FlagOf(object, meta::kIsConcrete, true);
     if (const StoredProperty* set = FindIn(object, meta::kProperties, StoredForm::StrongSet)) {
+        const std::string what = "a property of " + ToUtf8(record.name);
         for (const StoredObject& property : set->objects) {
-            record.properties.push_back(ReadProperty(property));
+            ReadInto(record.properties, notes, what.c_str(),
+                     [&] { return ReadProperty(property); });
         }
     }
     return record;
@@ -212,13 +227,16 @@ MetaRecords ReadMetaDictionary(const StoredObject& metaDictionary) {
         for (const StoredObject& object :
              RequiredSet(metaDictionary, meta::kClassDefinitions).objects) {
             if (GuidOf(object.classId) == AUID_AAFClassDef) {
-                records.classes.push_back(ReadClass(object));
+                ReadInto(records.classes, records.notes, "a class",
+                         [&] { return ReadClass(object, records.notes); });
             }
         }
         for (const StoredObject& object :
              RequiredSet(metaDictionary, meta::kTypeDefinitions).objects) {
             if (TypeKind kind{}; IsClassOfTypes(GuidOf(object.classId), &kind)) {
-                records.types.push_back(ReadType(object, kind));
+                const TypeKind known = kind;
+                ReadInto(records.types, records.notes, "a type",
+                         [&] { return ReadType(object, known); });
             }
         }
     } catch (const StoredError& problem) {

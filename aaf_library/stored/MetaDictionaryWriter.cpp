@@ -1,7 +1,9 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/BuiltIn.h"
+#include "aaf_library/model/PropertyKeys.h"
 #include "aaf_library/model/Text.h"
+#include "aaf_library/stored/CreationOrder.h"
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/MetaKinds.h"
 #include "aaf_library/stored/ModelNames.h"
@@ -102,6 +104,7 @@ StoredObject StoredClass(const MetaClass& record) {
         for (const MetaProperty& property : record.properties) {
             AddTo(properties, property.id, StoredPropertyDefinition(property));
         }
+        NumberProperties(properties, record);
         definition.AddSet(std::move(properties));
     }
     definition.AddFlag(meta::kIsConcrete, record.concrete);
@@ -245,6 +248,8 @@ StoredObject MetaDictionaryOf(const MetaRecords& records,
     for (const BuiltInType* entry : records.builtInTypes) {
         AddTo(types, entry->id, builtInType(*entry));
     }
+    NumberClasses(classes);
+    NumberTypes(types);
     StoredObject dictionary;
     dictionary.classId = AuidOf(AUID_AAFMetaDictionary);
     dictionary.properties.push_back(std::move(classes));
@@ -288,6 +293,29 @@ private:
 
 StoredObject StoredMetaDictionary(const MetaRecords& records) {
     return MetaDictionaryOf(records, StoredBuiltInClass, StoredBuiltInType);
+}
+
+StoredObject StoredDataDefinition(const BuiltInDefinition& entry) {
+    StoredObject object;
+    object.classId = AuidOf(AUID_AAFDataDefinition);
+    const auto add = [&](const PropertyKey& key, Bytes value) {
+        StoredProperty property;
+        property.pid = key.pid;
+        property.bytes = std::move(value);
+        object.properties.push_back(std::move(property));
+    };
+    const auto text = [](const char* ascii) {
+        return ByteWriter().AppendText(Utf16Of(Widen(ascii))).bytes();
+    };
+    add(prop::DefinitionObject_Identification, IdBytes(entry.id));
+    add(prop::DefinitionObject_Name, text(entry.name));
+    add(prop::DefinitionObject_Description, text(entry.description));
+    return object;
+}
+
+StoredObject LaidOutDataDefinition(const BuiltInDefinition& entry) {
+    static LaidOutTable<BuiltInDefinition> table(BuiltInDataDefinitions(), StoredDataDefinition);
+    return table.Definition(entry);
 }
 
 StoredObject LaidOutMetaDictionary(const MetaRecords& records) {

@@ -39,6 +39,8 @@ struct MetaRecords {
     // that was read all are above.
     std::vector<const BuiltInClass*> builtInClasses;
     std::vector<const BuiltInType*> builtInTypes;
+    // Of a file that was read: a sentence for each definition that makes no sense and is left out.
+    std::vector<std::string> notes;
 };
 
 bool operator==(const MetaRecords& left, const MetaRecords& right);
@@ -48,7 +50,12 @@ StoredObject StoredMetaDictionary(const MetaRecords& records);
 // The same for writing alone: what files have in common is laid out once.
 StoredObject LaidOutMetaDictionary(const MetaRecords& records);
 
-// Definitions of a kind that nobody knows are passed over. Throws StoredError.
+// A definition of data as the built-in model has it; the second is for writing alone.
+StoredObject StoredDataDefinition(const BuiltInDefinition& entry);
+StoredObject LaidOutDataDefinition(const BuiltInDefinition& entry);
+
+// Definitions of a kind that nobody knows are passed over, those that make no sense are left out
+// and noted. Throws StoredError when there is no set of classes or of types.
 MetaRecords ReadMetaDictionary(const StoredObject& metaDictionary);
 
 StoredAuid AuidOf(const GUID& id);

@@ -9,6 +9,7 @@
 #include "aaf_library/stored/ModelNames.h"
 #include "aaf_library/stored/ModelTypes.h"
 #include "aaf_library/stored/StoredError.h"
+#include "host_interfaces/aaf/AAFTypeIds.h"
 
 #include <algorithm>
 #include <utility>
@@ -44,10 +45,14 @@ MetaRegistration::MetaRegistration(const MetaRecords& records, Model& model) : m
         types_.emplace(record.id, &record);
     }
     for (const MetaClass& record : records.classes) {
-        EnterClass(record.id, 0);
+        if (EnterClass(record.id, 0) == nullptr) {
+            notes_.push_back("the class " + ToUtf8(record.name) + " has no parent and is left out");
+        }
     }
     for (const TypeFacts& record : records.types) {
-        EnterType(record.id, 0);
+        if (EnterType(record.id, 0) == nullptr) {
+            notes_.push_back("the type " + ToUtf8(record.name) + " makes no sense and is left out");
+        }
     }
     EnterProperties();
 }
@@ -97,14 +102,23 @@ ClassDefinition* MetaRegistration::EnterClass(const GUID& id, int depth) {
 
 TypeDefinition* MetaRegistration::EnterType(const GUID& id, int depth) {
     CheckLine(depth);
-    if (TypeDefinition* known = model_.FindType(id)) {
-        return known;
-    }
+    TypeDefinition* const known = model_.FindType(id);
     const auto found = types_.find(id);
     if (found == types_.end() || !begun_.insert(id).second) {
-        return nullptr;
+        return known;
     }
-    return MakeType(*found->second, depth);
+    const TypeFacts& record = *found->second;
+    if (known == nullptr) {
+        return MakeType(record, depth);
+    }
+    if (!RefersToClass(record.kind) && TargetPidOf(record.kind) != 0) {
+        EnterType(record.target, depth + 1);
+    }
+    if (!Redefine(*known, model_, record)) {
+        notes_.push_back("the type " + ToUtf8(record.name) +
+                         " is of another kind than elsewhere, which counts");
+    }
+    return known;
 }
 
 TypeDefinition* MetaRegistration::MakeType(const TypeFacts& record, int depth) {
@@ -150,10 +164,17 @@ void MetaRegistration::EnterProperties() {
                std::make_pair(a.second->pid, AuidOf(b.second->id));
     });
     for (const auto& [owner, property] : added) {
-        if (model_.FindProperty(property->id) == nullptr) {
-            model_.FindClass(owner->id)->AddProperty(property->id, property->name, property->type,
-                                                     property->optional, property->unique);
+        if (model_.FindProperty(property->id) != nullptr) {
+            continue;
         }
+        GUID type = property->type;
+        if (model_.FindType(type) == nullptr) {
+            notes_.push_back("the property " + ToUtf8(property->name) + " of " +
+                             ToUtf8(owner->name) + " has no type and is taken as bytes");
+            type = kAAFTypeID_UInt8Array;
+        }
+        model_.FindClass(owner->id)->AddProperty(property->id, property->name, type,
+                                                 property->optional, property->unique);
     }
 }
 

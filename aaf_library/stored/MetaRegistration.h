@@ -19,8 +19,9 @@ class TypeDefinition;
 namespace aaf::stored {
 
 // Registers with a model what a file's meta-dictionary defines beyond it, and
-// tells afterwards which property a number of that file means. The records
-// must outlive it.
+// tells afterwards which property a number of that file means. What the file
+// says of a built-in type (its name, the members of an enumeration, the type
+// that is renamed) counts for that model. The records must outlive it.
 class MetaRegistration {
 public:
     // Throws StoredError.
@@ -29,6 +30,9 @@ public:
     // The model's definition of what the file calls `pid` in objects of that
     // class; null when neither file nor model defines it.
     PropertyDefinition* property(ClassDefinition& definition, std::uint16_t pid) const;
+
+    // A sentence for each definition that the model can't take as the file has it.
+    const std::vector<std::string>& notes() const { return notes_; }
 
 private:
     ClassDefinition* EnterClass(const GUID& id, int depth);
@@ -40,6 +44,7 @@ private:
     std::unordered_map<GUID, const MetaClass*, GuidHash> classes_;
     std::unordered_map<GUID, const TypeFacts*, GuidHash> types_;
     std::unordered_set<GUID, GuidHash> begun_;
+    std::vector<std::string> notes_;
     // For each class of the file its own numbers.
     std::unordered_map<GUID, std::unordered_map<std::uint16_t, GUID>, GuidHash> pids_;
 };

@@ -29,8 +29,9 @@ FileResult LoadModel(const std::filesystem::path& path, Model& model, RefPtr<Obj
         return result;
     }
     try {
-        header = ReadModel(root, model);
-        return {};
+        FileResult result;
+        header = ReadModel(root, model, result.notes);
+        return result;
     } catch (const StoredError& problem) {
         return {FileFailure::Damaged, path.u8string() + ": " + problem.what()};
     } catch (const std::bad_alloc&) {

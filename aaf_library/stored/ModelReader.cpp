@@ -5,18 +5,26 @@
 #include "aaf_library/model/ClassDefinition.h"
 #include "aaf_library/model/Dictionary.h"
 #include "aaf_library/model/Model.h"
-#include "aaf_library/model/TypeDefinition.h"
+#include "aaf_library/model/TypeReference.h"
+#include "aaf_library/stored/KeptProperty.h"
 #include "aaf_library/stored/MetaPids.h"
 #include "aaf_library/stored/MetaRegistration.h"
 #include "aaf_library/stored/ModelNames.h"
 #include "aaf_library/stored/ModelTypes.h"
+#include "aaf_library/stored/PropertyFormat.h"
 #include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/StoredNames.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFTypeIds.h"
+
+#include <set>
 
 namespace aaf::stored {
 
 namespace {
+
+// A file that is damaged all over would have thousands.
+constexpr std::size_t kMostNotes = 100;
 
 const StoredObject& ContainedIn(const StoredObject& holder, std::uint16_t pid, const char* what) {
     const StoredProperty* property = holder.Find(pid);
@@ -28,8 +36,15 @@ const StoredObject& ContainedIn(const StoredObject& holder, std::uint16_t pid, c
 
 class ModelReader {
 public:
-    ModelReader(const MetaRecords& records, Model& model)
-        : model_(model), definitions_(records, model) {}
+    ModelReader(const MetaRecords& records, Model& model, std::vector<std::string>& notes)
+        : model_(model), definitions_(records, model), notes_(notes) {
+        for (const std::string& note : records.notes) {
+            Note(note);
+        }
+        for (const std::string& note : definitions_.notes()) {
+            Note(note);
+        }
+    }
 
     RefPtr<Object> ReadHeader(const StoredObject& from) {
         MergeDictionary(ContainedIn(from, prop::Header_Dictionary.pid, "dictionary"));
@@ -38,6 +53,9 @@ public:
         header->PutObject(prop::Header_Dictionary, model_.dictionary().Identity());
         if (header->ObjectAt(prop::Header_Content) == nullptr) {
             throw StoredError("has no content");
+        }
+        if (notMentioned_ != 0) {
+            notes_.push_back("and " + std::to_string(notMentioned_) + " more of the kind");
         }
         return header;
     }
@@ -64,29 +82,86 @@ private:
 
     void Fill(Object& object, const StoredObject& from, const GUID& leftOut = {}) {
         for (const StoredProperty& property : from.properties) {
-            PropertyDefinition* definition =
+            const PropertyDefinition* definition =
                 definitions_.property(object.classDefinition(), property.pid);
-            if (definition == nullptr || definition->type() == nullptr ||
-                definition->id() == leftOut ||
+            if (definition == nullptr) {
+                Note(Place() + ToUtf8(object.classDefinition().name()) + ": " +
+                     PropertyText(property.pid) + " is defined nowhere; it is left out");
+                continue;
+            }
+            if (definition->id() == leftOut ||
                 definition->id() == prop::InterchangeObject_ObjClass.id) {
                 continue;
             }
-            try {
-                const RefPtr<PropertyValue> value = ValueOf(*definition->type(), property);
-                if (object.PutValue(definition->pid(), value.get()) < 0) {
-                    throw StoredError("an object cannot hold it");
-                }
-            } catch (const StoredError& problem) {
-                throw StoredError(ToUtf8(definition->name()) + ": " + problem.what());
+            place_.push_back(definition);
+            ReadProperty(object, *definition, property);
+            place_.pop_back();
+        }
+    }
+
+    void ReadProperty(Object& object, const PropertyDefinition& definition,
+                      const StoredProperty& from) {
+        try {
+            if (definition.type() == nullptr) {
+                throw StoredError("has a type that is defined nowhere");
             }
+            const RefPtr<PropertyValue> value = ValueOf(*definition.type(), from);
+            if (object.PutValue(definition.pid(), value.get()) < 0) {
+                throw StoredError("an object cannot hold it");
+            }
+        } catch (const StoredError& problem) {
+            KeepAsStored(object, definition, from, problem.what());
+        }
+    }
+
+    void KeepAsStored(Object& object, const PropertyDefinition& definition,
+                      const StoredProperty& from, const std::string& problem) {
+        if (object.MadeValues().Find(definition.pid()) != nullptr) {
+            Note(Place() + problem + "; it is left out");
+            return;
+        }
+        const RefPtr<PropertyValue> value =
+            model_.NewValue(*model_.FindType(kAAFTypeID_UInt8Array));
+        value->BytesToChange() = BytesToShow(from);
+        value->KeepAsStored(Keep(from, [this](const StoredObject& holder, std::uint16_t pid) {
+            ClassDefinition* known = model_.FindClass(GuidOf(holder.classId));
+            const PropertyDefinition* meant =
+                known == nullptr ? nullptr : definitions_.property(*known, pid);
+            return meant == nullptr ? GUID{} : meant->id();
+        }));
+        object.PutValue(definition.pid(), value.get());
+        Note(Place() + problem + "; it is kept as it stands");
+    }
+
+    // Where the reader is: "Content: Mobs: Slots: ".
+    std::string Place() const {
+        std::string text;
+        for (const PropertyDefinition* step : place_) {
+            text += ToUtf8(step->name()) + ": ";
+        }
+        return text;
+    }
+
+    void Note(std::string note) {
+        if (notes_.size() < kMostNotes) {
+            notes_.push_back(std::move(note));
+        } else {
+            ++notMentioned_;
         }
     }
 
     RefPtr<PropertyValue> ValueOf(TypeDefinition& type, const StoredProperty& from) {
-        if (StoredFormOf(type) != from.form) {
+        if (!from.problem.empty()) {
+            throw StoredError(from.problem);
+        }
+        // Many files hold a set of objects where the type says vector.
+        const StoredForm form = StoredFormOf(type);
+        const bool fits = from.form == form ||
+                          (form == StoredForm::StrongVector && from.form == StoredForm::StrongSet);
+        if (!fits) {
             throw StoredError("is stored in another form than its type has");
         }
-        if (from.form == StoredForm::Data) {
+        if (form == StoredForm::Data) {
             CheckSize(type, from.bytes.size());
         }
         RefPtr<PropertyValue> value = model_.NewValue(type);
@@ -98,7 +173,7 @@ private:
             case StoredForm::WeakReference:
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                value->BytesToChange() = TargetsOf(from);
+                value->BytesToChange() = TargetsOf(type, from);
                 break;
             case StoredForm::StrongReference:
             case StoredForm::StrongVector:
@@ -124,11 +199,16 @@ private:
         }
     }
 
-    static Bytes TargetsOf(const StoredProperty& from) {
+    Bytes TargetsOf(const TypeDefinition& type, const StoredProperty& from) {
+        const GUID& targetClass =
+            static_cast<const TypeReference&>(ReferenceIn(type)).targetClass();
         Bytes ids;
         for (const Bytes& key : from.keys) {
             if (key.size() != sizeof(StoredAuid)) {
                 throw StoredError("a weak reference by something else than an id");
+            }
+            if (model_.FindTarget(targetClass, GuidOf(key)) == nullptr) {
+                throw StoredError("a weak reference to what the file does not have");
             }
             ids.insert(ids.end(), key.begin(), key.end());
         }
@@ -137,77 +217,128 @@ private:
 
     void AddObjects(PropertyValue& value, const TypeDefinition& type, const StoredProperty& from) {
         const GUID expected = FactsOf(ReferenceIn(type)).target;
+        const bool isSet = StoredFormOf(type) == StoredForm::StrongSet;
+        std::set<Bytes> keys;
         for (std::size_t i = 0; i < from.objects.size(); ++i) {
             const RefPtr<Object> object = NewObject(from.objects[i], expected);
             Fill(*object, from.objects[i]);
-            if (from.form == StoredForm::StrongSet && object->UniqueKey() != from.keys[i]) {
-                throw StoredError("an element whose key differs from that in the index");
+            if (isSet && !keys.insert(KeyOfElement(*object, from.keys[i])).second) {
+                throw StoredError("two elements have one key");
             }
             if (value.InsertObject(i, object.get()) < 0) {
                 throw StoredError("an object that cannot be contained");
             }
         }
-        if (from.form == StoredForm::StrongSet) {
+        if (isSet) {
             value.SortByKey();
         }
     }
 
+    // An element stores its key, and the index has it too. Where they differ
+    // the element's own counts, and the index's where it has none.
+    Bytes KeyOfElement(Object& object, const Bytes& inIndex) {
+        const Bytes own = object.UniqueKey();
+        if (own == inIndex) {
+            return own;
+        }
+        if (!own.empty()) {
+            Note(Place() + "an element whose key differs from that in the index; its own counts");
+            return own;
+        }
+        const PropertyDefinition* key = object.classDefinition().FindUniqueProperty();
+        if (key == nullptr || key->type() == nullptr ||
+            key->type()->StoredSize() != inIndex.size()) {
+            throw StoredError("an element without a key");
+        }
+        Note(Place() + "an element without a key; that in the index counts");
+        object.RequireValue(key->key())->BytesToChange() = inIndex;
+        return inIndex;
+    }
+
     // The model has a dictionary with the built-in definitions. Those of the
     // file that are known get what the file says of them, others are added.
+    // They may refer to one another, so all are there before any is filled.
     void MergeDictionary(const StoredObject& from) {
         Dictionary& dictionary = model_.dictionary();
         StoredObject others;
+        std::vector<Entered> entered;
         for (const StoredProperty& property : from.properties) {
-            PropertyDefinition* definition =
+            const PropertyDefinition* definition =
                 definitions_.property(dictionary.classDefinition(), property.pid);
-            if (definition == nullptr || definition->type() == nullptr) {
-                continue;
-            }
-            if (property.form != StoredForm::StrongSet ||
-                StoredFormOf(*definition->type()) != StoredForm::StrongSet) {
+            const bool isSet = definition != nullptr && definition->type() != nullptr &&
+                               property.problem.empty() && property.form == StoredForm::StrongSet &&
+                               StoredFormOf(*definition->type()) == StoredForm::StrongSet;
+            if (isSet) {
+                EnterSet(dictionary, *definition, property, entered);
+            } else {
                 others.properties.push_back(property);
-                continue;
-            }
-            try {
-                MergeSet(dictionary, *definition, property);
-            } catch (const StoredError& problem) {
-                throw StoredError(ToUtf8(definition->name()) + ": " + problem.what());
             }
         }
+        for (const Entered& entry : entered) {
+            place_.assign(1, entry.set);
+            Fill(*entry.object, *entry.stored);
+        }
+        place_.clear();
         Fill(dictionary, others);
     }
 
-    void MergeSet(Dictionary& dictionary, const PropertyDefinition& definition,
-                  const StoredProperty& from) {
+    struct Entered {
+        const PropertyDefinition* set;
+        RefPtr<Object> object;
+        const StoredObject* stored;
+    };
+
+    void EnterSet(Dictionary& dictionary, const PropertyDefinition& definition,
+                  const StoredProperty& from, std::vector<Entered>& entered) {
         const GUID expected = FactsOf(ReferenceIn(*definition.type())).target;
+        place_.assign(1, &definition);
         for (std::size_t i = 0; i < from.objects.size(); ++i) {
-            const Bytes& key = from.keys[i];
-            Object* known = dictionary.FindInSet(definition.key(), key.data(), key.size());
-            RefPtr<Object> object(known);
-            if (known == nullptr) {
-                object = NewObject(from.objects[i], expected);
-            }
-            Fill(*object, from.objects[i]);
-            if (object->UniqueKey() != key) {
-                throw StoredError("an element whose key differs from that in the index");
-            }
-            if (known == nullptr && dictionary.AddToSet(definition.key(), object->Identity()) < 0) {
-                throw StoredError("a definition that cannot be added");
+            const StoredObject& stored = from.objects[i];
+            try {
+                const RefPtr<Object> object = NewObject(stored, expected);
+                const Bytes key = KeyOfDefinition(*object, stored, from.keys[i]);
+                RefPtr<Object> known(dictionary.FindDefinition(definition.pid(), GuidOf(key)));
+                if (!known) {
+                    if (dictionary.AddDefinition(definition.pid(), object.get()) < 0) {
+                        throw StoredError("a definition that cannot be added");
+                    }
+                    known = object;
+                }
+                entered.push_back({&definition, known, &stored});
+            } catch (const StoredError& problem) {
+                Note(Place() + problem.what() + "; it is left out");
             }
         }
+        place_.clear();
+    }
+
+    // The only property that a definition needs to be found.
+    Bytes KeyOfDefinition(Object& object, const StoredObject& stored, const Bytes& inIndex) {
+        for (const StoredProperty& property : stored.properties) {
+            const PropertyDefinition* definition =
+                definitions_.property(object.classDefinition(), property.pid);
+            if (definition != nullptr && definition->IsUnique() && property.problem.empty() &&
+                property.form == StoredForm::Data && property.bytes.size() == kAuidKeySize) {
+                object.RequireValue(definition->key())->BytesToChange() = property.bytes;
+            }
+        }
+        return KeyOfElement(object, inIndex);
     }
 
     Model& model_;
     MetaRegistration definitions_;
+    std::vector<std::string>& notes_;
+    std::size_t notMentioned_ = 0;
+    std::vector<const PropertyDefinition*> place_;
 };
 
 }  // namespace
 
-RefPtr<Object> ReadModel(const StoredObject& root, Model& model) {
+RefPtr<Object> ReadModel(const StoredObject& root, Model& model, std::vector<std::string>& notes) {
     const MetaRecords records =
         ReadMetaDictionary(ContainedIn(root, meta::kRootMetaDictionary, "meta-dictionary"));
     const StoredObject& header = ContainedIn(root, meta::kRootHeader, "header");
-    ModelReader reader(records, model);
+    ModelReader reader(records, model, notes);
     return reader.ReadHeader(header);
 }
 

@@ -5,6 +5,9 @@
 #include "aaf_library/model/RefPtr.h"
 #include "aaf_library/stored/StoredTree.h"
 
+#include <string>
+#include <vector>
+
 namespace aaf {
 class Model;
 class Object;
@@ -16,8 +19,10 @@ namespace aaf::stored {
 // that the model lacks are registered, those of the file's dictionary join the
 // model's, and the header comes back with everything in it; its dictionary is
 // the model's. Properties are told by their ids, so the file's own
-// numbers do not matter. Values that nothing describes are passed over.
-// Throws StoredError; the model then is of no further use.
-RefPtr<Object> ReadModel(const StoredObject& root, Model& model);
+// numbers do not matter. A property that is no value of its type is kept as it
+// stands (PropertyValue::asStored); one that nothing describes is left out.
+// Each such place is a sentence in the notes. Throws StoredError; the model
+// then is of no further use.
+RefPtr<Object> ReadModel(const StoredObject& root, Model& model, std::vector<std::string>& notes);
 
 }  // namespace aaf::stored

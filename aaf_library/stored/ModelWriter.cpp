@@ -6,6 +6,7 @@
 #include "aaf_library/model/Dictionary.h"
 #include "aaf_library/model/Model.h"
 #include "aaf_library/model/TypeDefinition.h"
+#include "aaf_library/stored/KeptProperty.h"
 #include "aaf_library/stored/MetaClosure.h"
 #include "aaf_library/stored/MetaPids.h"
 #include "aaf_library/stored/ModelNames.h"
@@ -29,17 +30,12 @@ using Path = std::vector<std::uint16_t>;
 
 constexpr std::size_t kIdSize = sizeof(StoredAuid);
 
-bool IsBuiltInDefinition(const Bytes& id) {
+bool IsBuiltInContainer(const Bytes& id) {
     const GUID wanted = GuidOf(id);
-    for (Span<BuiltInDefinition> table :
-         {BuiltInDataDefinitions(), BuiltInContainerDefinitions()}) {
-        for (const BuiltInDefinition& definition : table) {
-            if (definition.id == wanted) {
-                return true;
-            }
-        }
-    }
-    return false;
+    const Span<BuiltInDefinition> table = BuiltInContainerDefinitions();
+    return std::any_of(table.begin(), table.end(), [&](const BuiltInDefinition& definition) {
+        return definition.id == wanted;
+    });
 }
 
 bool IsWeak(StoredForm form) {
@@ -58,10 +54,13 @@ void SortByPid(StoredObject& object) {
 
 class ModelWriter {
 public:
-    using MetaDictionary = StoredObject (*)(const MetaRecords&);
+    // What is written of definitions that files have in common.
+    struct Common {
+        StoredObject (*metaDictionary)(const MetaRecords&);
+        StoredObject (*dataDefinition)(const BuiltInDefinition&);
+    };
 
-    ModelWriter(Model& model, MetaDictionary metaDictionary)
-        : model_(model), closure_(model), metaDictionary_(metaDictionary) {}
+    ModelWriter(Model& model, Common common) : model_(model), closure_(model), common_(common) {}
 
     // The content stands in place of the header's own; it may be of another model.
     StoredObject Write(Object& header, const Object* content) {
@@ -77,7 +76,7 @@ public:
         StoredObject root;
         root.classId = kRootClassId;
         root.properties.push_back(ReferenceTo(meta::kRootMetaDictionary, u"MetaDictionary",
-                                              metaDictionary_(closure_.records())));
+                                              common_.metaDictionary(closure_.records())));
         root.properties.push_back(
             ReferenceTo(meta::kRootHeader, u"Header", std::move(storedHeader)));
         return root;
@@ -91,6 +90,7 @@ private:
         StoredProperty empty;                // of the right form and name, holding nothing yet
         std::set<Bytes>* targets = nullptr;  // weak forms: what references to that set lead to
         bool carriesType = false;
+        bool isSetOfParameters = false;
     };
     // What all objects of a class have in common.
     struct ClassFacts {
@@ -118,8 +118,7 @@ private:
         out.properties.reserve(from.values().size() + 2);
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
-                out.properties.push_back(
-                    StoredPropertyOf(FactsOfProperty(facts, from, entry.first), *entry.second));
+                out.properties.push_back(StoredPropertyOf(facts, from, entry.first, *entry.second));
             }
         }
         AddRequired(facts, out, leftOut);
@@ -160,6 +159,22 @@ private:
                 return known;
             }
         }
+        const PropertyDefinition& definition = DefinitionOf(facts, from, pid);
+        PropertyFacts& made = facts.properties.emplace_back();
+        made.from = pid;
+        made.definition = &definition;
+        made.empty = EmptyProperty(definition);
+        if (IsWeak(made.empty.form)) {
+            NameTargets(made);
+        }
+        const TypeKind kind = definition.type()->Resolved().kind();
+        made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
+        made.isSetOfParameters = definition.id() == prop::OperationGroup_Parameters.id;
+        return made;
+    }
+
+    const PropertyDefinition& DefinitionOf(const ClassFacts& facts, const Object& from,
+                                           PropertyId pid) {
         const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
         const bool isHere = facts.definition == &from.classDefinition() && pid < kFirstLocalPid;
         if (definition != nullptr && from.model() != &model_ && !isHere) {
@@ -169,16 +184,54 @@ private:
         if (definition == nullptr || definition->type() == nullptr) {
             throw StoredError(PropertyText(pid) + " has no definition");
         }
-        PropertyFacts& made = facts.properties.emplace_back();
-        made.from = pid;
-        made.definition = definition;
-        made.empty = EmptyProperty(*definition);
-        if (IsWeak(made.empty.form)) {
-            NameTargets(made);
+        return *definition;
+    }
+
+    StoredProperty StoredPropertyOf(ClassFacts& facts, const Object& from, PropertyId pid,
+                                    const PropertyValue& value) {
+        return value.asStored() ? AsItStands(DefinitionOf(facts, from, pid), value)
+                                : StoredPropertyOf(FactsOfProperty(facts, from, pid), value);
+    }
+
+    // What a file held in place of a value, with the numbers that this one has.
+    StoredProperty AsItStands(const PropertyDefinition& definition, const PropertyValue& value) {
+        const auto& kept = static_cast<const KeptProperty&>(*value.asStored());
+        TakeAlong(value);
+        for (const auto& [set, id] : kept.targets) {
+            if (model_.dictionary().FindDefinition(set, id) != nullptr) {
+                const StoredAuid key = AuidOf(id);
+                targets_[{meta::kRootHeader, prop::Header_Dictionary.pid, set}].insert(
+                    Bytes(key.begin(), key.end()));
+            }
         }
-        const TypeKind kind = definition->type()->Resolved().kind();
-        made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
-        return made;
+        StoredProperty out = kept.property;
+        out.pid = definition.pid();
+        if (!out.name.empty()) {
+            out.name = Utf16Of(definition.name());
+        } else if (!out.bytes.empty()) {
+            out.bytes = value.bytes();
+        }
+        ForEachObject(out, [&](StoredObject& object) {
+            if (const GUID id = GuidOf(object.classId); model_.FindClass(id) != nullptr) {
+                closure_.AddClass(id);
+            }
+            Renumber(object, kept.numbers);
+        });
+        return out;
+    }
+
+    void Renumber(StoredObject& object, const std::unordered_map<std::uint16_t, GUID>& numbers) {
+        std::vector<StoredProperty> known;
+        for (StoredProperty& property : object.properties) {
+            if (const auto local = numbers.find(property.pid); local != numbers.end()) {
+                const PropertyDefinition* const definition = model_.FindProperty(local->second);
+                property.pid = definition == nullptr ? kNoPropertyId : definition->pid();
+            }
+            if (property.pid != kNoPropertyId) {
+                known.push_back(std::move(property));
+            }
+        }
+        object.properties = std::move(known);
     }
 
     StoredProperty StoredPropertyOf(const PropertyFacts& facts, const PropertyValue& value) {
@@ -219,6 +272,9 @@ private:
                         out.keys.push_back(object.UniqueKey());
                     }
                 }
+                if (facts.isSetOfParameters) {
+                    StoreAsSet(out, prop::Parameter_Definition.pid);
+                }
                 break;
             case StoredForm::WeakReference:
             case StoredForm::WeakVector:
@@ -226,6 +282,22 @@ private:
                 AddTargets(out, facts, value);
                 break;
         }
+    }
+
+    // A vector whose elements have different keys becomes a set; others stay what they are.
+    static void StoreAsSet(StoredProperty& vector, PropertyId keyPid) {
+        std::set<Bytes> keys;
+        for (const StoredObject& object : vector.objects) {
+            const StoredProperty* const key = object.Find(keyPid);
+            if (key == nullptr || key->bytes.size() != kIdSize || !keys.insert(key->bytes).second) {
+                return;
+            }
+        }
+        for (const StoredObject& object : vector.objects) {
+            vector.keys.push_back(object.Find(keyPid)->bytes);
+        }
+        vector.form = StoredForm::StrongSet;
+        vector.keyPid = keyPid;
     }
 
     // A property of the right form and name that holds nothing yet.
@@ -355,17 +427,16 @@ private:
         return out;
     }
 
-    // Of the definitions that every model has from the start only those are
-    // stored that something refers to. A definition may refer to others, so
-    // the sets are gone through until nothing is added.
+    // Of the definitions that every model has from the start all of data are
+    // stored, of others only those that something refers to. A definition may
+    // refer to others, so the sets are gone through until nothing is added.
     StoredObject StoredDictionary(const Dictionary& from) {
         StoredObject out;
         ClassFacts& facts = FactsOfClass(from);
         out.classId = facts.id;
         for (const auto& [pid, value] : from.MadeValues()) {
             if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
-                out.properties.push_back(
-                    StoredPropertyOf(FactsOfProperty(facts, from, pid), *value));
+                out.properties.push_back(StoredPropertyOf(facts, from, pid, *value));
             }
         }
         std::map<PropertyId, StoredProperty> sets;
@@ -385,6 +456,7 @@ private:
                 AddDefinitions(set->second, value->objects(), stored);
             }
         } while (stored.size() != before);
+        AddDataDefinitions(from, sets);
         for (auto& set : sets) {
             if (!set.second.objects.empty()) {
                 out.properties.push_back(std::move(set.second));
@@ -415,10 +487,32 @@ private:
         const Path path = {meta::kRootHeader, prop::Header_Dictionary.pid, set.pid};
         for (const RefPtr<Object>& definition : definitions) {
             const Bytes key = definition->UniqueKey();
-            const bool wanted = !IsBuiltInDefinition(key) || targets_[path].count(key) != 0;
+            const bool wanted = !IsBuiltInContainer(key) || targets_[path].count(key) != 0;
             if (wanted && stored.insert(definition.get()).second) {
                 set.keys.push_back(key);
                 set.objects.push_back(StoredObjectOf(*definition));
+            }
+        }
+    }
+
+    // Programs that extend a file look for all of them. Those that nobody looked up say what the
+    // built-in model says.
+    void AddDataDefinitions(const Dictionary& from, std::map<PropertyId, StoredProperty>& sets) {
+        const PropertyKey& key = prop::Dictionary_DataDefinitions;
+        const auto [place, isNew] = sets.try_emplace(key.pid);
+        StoredProperty& set = place->second;
+        if (isNew) {
+            set = EmptyProperty(*from.classDefinition().FindProperty(key.pid));
+        }
+        set.keys.reserve(set.keys.size() + BuiltInDataDefinitions().size());
+        set.objects.reserve(set.objects.size() + BuiltInDataDefinitions().size());
+        closure_.AddClass(AUID_AAFDataDefinition);
+        for (const BuiltInDefinition& entry : BuiltInDataDefinitions()) {
+            const StoredAuid id = AuidOf(entry.id);
+            const Bytes bytes(id.begin(), id.end());
+            if (std::find(set.keys.begin(), set.keys.end(), bytes) == set.keys.end()) {
+                set.keys.push_back(bytes);
+                set.objects.push_back(common_.dataDefinition(entry));
             }
         }
     }
@@ -448,7 +542,7 @@ private:
 
     Model& model_;
     MetaClosure closure_;
-    const MetaDictionary metaDictionary_;
+    const Common common_;
     const Object* replaced_ = nullptr;
     const Object* content_ = nullptr;
     std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
@@ -458,11 +552,12 @@ private:
 }  // namespace
 
 StoredObject TreeOfModel(Model& model, Object& header) {
-    return ModelWriter(model, StoredMetaDictionary).Write(header, nullptr);
+    return ModelWriter(model, {StoredMetaDictionary, StoredDataDefinition}).Write(header, nullptr);
 }
 
 StoredObject TreeToWrite(Model& model, Object& header, const Object* content) {
-    return ModelWriter(model, LaidOutMetaDictionary).Write(header, content);
+    return ModelWriter(model, {LaidOutMetaDictionary, LaidOutDataDefinition})
+        .Write(header, content);
 }
 
 }  // namespace aaf::stored

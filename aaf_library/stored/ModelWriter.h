@@ -11,7 +11,7 @@ class Object;
 
 namespace aaf::stored {
 
-// The tree of a whole file: the header with everything in it, the definitions
+// The tree of a whole file: the header with everything in it, all definitions of data, the others
 // of the dictionary that are referred to or that a caller added, and the
 // meta-dictionary with all classes, properties and types that these need, plus
 // every extension that is registered. Required collections that are absent are

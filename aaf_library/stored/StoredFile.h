@@ -25,6 +25,9 @@ enum class FileFailure {
 struct FileResult {
     FileFailure failure = FileFailure::None;
     std::string message;
+    // Of a model that was read all the same: a sentence for each thing in the file that makes no
+    // sense.
+    std::vector<std::string> notes = {};
 
     explicit operator bool() const { return failure == FileFailure::None; }
 };

@@ -22,7 +22,7 @@ bool operator==(const StoredProperty& left, const StoredProperty& right) {
     return left.pid == right.pid && left.form == right.form && left.name == right.name &&
            left.bytes == right.bytes && left.objects == right.objects && left.keys == right.keys &&
            left.keyPid == right.keyPid && left.keySize == right.keySize &&
-           left.targetPath == right.targetPath;
+           left.targetPath == right.targetPath && left.problem == right.problem;
 }
 
 }  // namespace aaf::stored

@@ -38,7 +38,8 @@ struct LaidOut;
 struct StoredProperty;
 
 // One object: a storage of the file. Every pid occurs once among the
-// properties, whose order is the order in the file.
+// properties, whose order is the order in the file; of those read from a file
+// the first with a pid counts, others have a problem.
 struct StoredObject {
     StoredAuid classId{};
     std::vector<StoredProperty> properties;
@@ -79,9 +80,20 @@ struct StoredProperty {
     std::uint16_t keyPid = 0;
     std::uint8_t keySize = 16;
 
+    // Strong set: the number in the name of each object's storage, no two alike.
+    // Unless there are as many as objects, they are numbered in the order of
+    // their keys. Two trees that differ in these are equal.
+    std::vector<std::uint32_t> localKeys;
+
     // Weak forms: the pids from the root object down to the strong set that
     // holds the targets.
     std::vector<std::uint16_t> targetPath;
+
+    // What kept a reader from making sense of the property; empty for most.
+    // Then `bytes` is the value as it stands, or, when there is a name, the
+    // stream beside it: what could be read of it. Objects are written whatever
+    // keys they have.
+    std::string problem;
 };
 
 bool operator==(const StoredObject& left, const StoredObject& right);

@@ -26,17 +26,22 @@ public:
     }
 
 private:
+    bool Has(const Entry& storage, const std::u16string& name, Kind kind) const {
+        const auto found = storage.contained.find(name);
+        return found != storage.contained.end() && file_.entry(found->second).kind == kind;
+    }
+
     // The entry of that name in a storage. Each is handed out once, so no two
     // properties can share an object.
     std::uint32_t Take(const Entry& storage, const std::u16string& name, Kind kind) {
-        const auto found = storage.contained.find(name);
-        if (found == storage.contained.end() || file_.entry(found->second).kind != kind) {
+        if (!Has(storage, name, kind)) {
             throw StoredError("\"" + ToUtf8(name) + "\" is missing");
         }
-        if (!taken_.insert(found->second).second) {
+        const std::uint32_t index = storage.contained.at(name);
+        if (!taken_.insert(index).second) {
             throw StoredError("\"" + ToUtf8(name) + "\" is referred to twice");
         }
-        return found->second;
+        return index;
     }
 
     Bytes ReadStream(const Entry& storage, const std::u16string& name) {
@@ -103,10 +108,11 @@ private:
             try {
                 property.bytes = values.TakeBytes(size);
                 if (!pids.insert(property.pid).second) {
-                    throw StoredError("occurs twice");
+                    property.problem = "occurs twice";
+                } else if (size != 0) {
+                    Resolve(storage, property, depth);
                 }
                 if (size != 0) {
-                    Resolve(storage, property, depth);
                     object.properties.push_back(std::move(property));
                 }
             } catch (const StoredError& problem) {
@@ -130,20 +136,63 @@ private:
             case StoredForm::StrongSet:
                 return ReadStrongCollection(storage, property, value, depth);
             case StoredForm::WeakReference:
-                return ReadWeakReference(property, value);
+                property.bytes = value;
+                return Tolerate(property, [&] { ReadWeakReference(property, value); });
             case StoredForm::WeakVector:
             case StoredForm::WeakSet:
-                return ReadWeakCollection(storage, property, value);
+                if (ReadNamedStream(storage, property, value, ByteReader(value), IndexName)) {
+                    Tolerate(property, [&] { ReadWeakIndex(property); });
+                }
+                return;
             case StoredForm::Stream: {
-                ByteReader from(value);
-                from.TakeNumber<std::uint8_t>();  // the byte order, of no use for plain bytes
-                property.bytes = ReadStream(storage, StoredName(property, from));
+                // The byte order comes first, of no use for plain bytes.
+                const auto itself = [](const std::u16string& name) { return name; };
+                ReadNamedStream(storage, property, value,
+                                ByteReader(value.data() + 1, value.size() - 1), itself);
                 return;
             }
             case StoredForm::Data:
                 break;
         }
         property.bytes = value;
+    }
+
+    // Keeps the bytes when they make no sense, and drops them when they do.
+    template <class Read>
+    static void Tolerate(StoredProperty& property, const Read& read) {
+        try {
+            read();
+            property.bytes.clear();
+        } catch (const StoredError& problem) {
+            property.problem = problem.what();
+            property.keys.clear();
+            property.keySize = kAuidKeySize;
+            property.targetPath.clear();
+        }
+    }
+
+    // Reads the stream whose name the value tells. False when the value tells
+    // none that is there.
+    template <class NameOfStream>
+    bool ReadNamedStream(const Entry& storage, StoredProperty& property, const Bytes& value,
+                         ByteReader from, const NameOfStream& nameOf) {
+        property.bytes = value;
+        std::u16string name;
+        try {
+            name = nameOf(StoredName(property, from));
+        } catch (const StoredError& problem) {
+            property.problem = problem.what();
+            return false;
+        }
+        if (!property.name.empty()) {
+            property.bytes.clear();
+        }
+        if (!Has(storage, name, Kind::Stream)) {
+            property.problem = "\"" + ToUtf8(name) + "\" is missing";
+            return false;
+        }
+        property.bytes = ReadStream(storage, name);
+        return true;
     }
 
     static std::u16string StoredName(StoredProperty& property, ByteReader from) {
@@ -180,6 +229,7 @@ private:
             if (isSet) {
                 from.TakeNumber<std::uint32_t>();  // the count of references
                 property.keys.push_back(from.TakeBytes(property.keySize));
+                property.localKeys.push_back(localKey);
             }
             property.objects.push_back(ReadContained(storage, ElementName(name, localKey), depth));
         }
@@ -195,9 +245,8 @@ private:
         property.keys.push_back(from.TakeBytes(property.keySize));
     }
 
-    void ReadWeakCollection(const Entry& storage, StoredProperty& property, const Bytes& value) {
-        const Bytes index = ReadStream(storage, IndexName(StoredName(property, ByteReader(value))));
-        ByteReader from(index);
+    void ReadWeakIndex(StoredProperty& property) {
+        ByteReader from(property.bytes);
         const auto count = from.TakeNumber<std::uint32_t>();
         ReadTarget(property, from);
         ReadKeySize(property, from);

@@ -236,6 +236,13 @@ private:
                 return AddStrongVector(layout, property);
             case StoredForm::StrongSet:
                 return AddStrongSet(layout, property);
+            default:
+                break;
+        }
+        if (!property.problem.empty()) {
+            return AddAsItStands(layout, property);
+        }
+        switch (property.form) {
             case StoredForm::WeakReference:
                 return AddWeakReference(layout, property);
             case StoredForm::WeakVector:
@@ -243,11 +250,33 @@ private:
                 return AddWeakCollection(layout, property);
             case StoredForm::Stream:
                 return AddStream(layout, property);
-            case StoredForm::Data:
-                break;
+            default:
+                return AddData(layout, property);
         }
+    }
+
+    static void AddData(Layout& layout, const StoredProperty& property) {
         if (!property.bytes.empty()) {
             layout.Add(property, [&](ByteWriter& value) { value.Append(property.bytes); });
+        }
+    }
+
+    // Something that a reader made no sense of; so will others.
+    static void AddAsItStands(Layout& layout, const StoredProperty& property) {
+        const bool isStream = property.form == StoredForm::Stream;
+        if (property.name.empty()) {
+            return AddData(layout, property);
+        }
+        const std::u16string name = isStream ? SingleName(property.name, property.pid)
+                                             : CollectionName(property.name, property.pid);
+        layout.Add(property, [&](ByteWriter& value) {
+            if (isStream) {
+                value.AppendNumber(kStreamMark);
+            }
+            value.AppendText(name);
+        });
+        if (!property.bytes.empty()) {
+            layout.streams.push_back({isStream ? name : IndexName(name), {}, &property.bytes});
         }
     }
 
@@ -278,18 +307,24 @@ private:
         const std::u16string name = CollectionName(property.name, property.pid);
         const std::vector<std::size_t> order = KeyOrder(property);
         const auto count = static_cast<std::uint32_t>(order.size());
+        const bool isNumbered = property.localKeys.size() == order.size() && count != 0;
+        const std::uint32_t firstFree =
+            isNumbered ? *std::max_element(property.localKeys.begin(), property.localKeys.end()) + 1
+                       : count;
         ByteWriter index;
-        index.AppendNumber(count).AppendNumber(count).AppendNumber(kNoLastFreeKey);
+        index.AppendNumber(count).AppendNumber(firstFree).AppendNumber(kNoLastFreeKey);
         index.AppendNumber(property.keyPid).AppendNumber(CheckedKeySize(property));
         for (std::uint32_t i = 0; i < count; ++i) {
             const StoredObject& object = property.objects[order[i]];
             const Bytes& key = property.keys[order[i]];
             const StoredProperty* stored = object.Find(property.keyPid);
-            if (stored == nullptr || stored->bytes != key) {
+            const bool hasKey = stored != nullptr && stored->bytes == key;
+            if (!hasKey && property.problem.empty()) {
                 throw StoredError("an element does not store its key");
             }
-            index.AppendNumber(i).AppendNumber(kSetReferenceCount).Append(key);
-            layout.children.push_back({ElementName(name, i), &object});
+            const std::uint32_t localKey = isNumbered ? property.localKeys[order[i]] : i;
+            index.AppendNumber(localKey).AppendNumber(kSetReferenceCount).Append(key);
+            layout.children.push_back({ElementName(name, localKey), &object});
         }
         layout.AddName(property, name);
         layout.streams.push_back({IndexName(name), index.Take(), nullptr});

@@ -37,8 +37,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         const StoredObject tree = ReadTree(Bytes(data, data + size));
         CheckTree(tree);
         const aaf::RefPtr<aaf::Model> model = aaf::Model::Create(classes);
-        const aaf::RefPtr<aaf::Object> header = ReadModel(tree, *model);
-        TreeOfModel(*model, *header);
+        std::vector<std::string> notes;
+        const aaf::RefPtr<aaf::Object> header = ReadModel(tree, *model, notes);
+        CheckTree(TreeOfModel(*model, *header));
     } catch (const StoredError&) {
         // Refused, as most of what a fuzzer makes should be.
     }

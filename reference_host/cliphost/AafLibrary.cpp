@@ -11,6 +11,7 @@
 #include "host_interfaces/aaf/AAFResultCodes.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/PrivateFile.h"
@@ -35,21 +36,21 @@ std::wstring WideName(const std::filesystem::path& path) {
     return encodings::ToWideLossy(host::system::FromSystemPath(path));
 }
 
-// Keeps the last sentence that the library writes for people, while this lives.
-class LibrarySentence final : public IAAFDiagnosticOutput {
+// Keeps the sentences that the library writes for people, while this lives.
+class LibrarySentences final : public IAAFDiagnosticOutput {
 public:
-    explicit LibrarySentence(AAFSetDiagnosticOutputFunction set) : set_(set) {
+    explicit LibrarySentences(AAFSetDiagnosticOutputFunction set) : set_(set) {
         if (set_) {
             set_(this);
         }
     }
-    ~LibrarySentence() {
+    ~LibrarySentences() {
         if (set_) {
             set_(nullptr);
         }
     }
-    LibrarySentence(const LibrarySentence&) = delete;
-    LibrarySentence& operator=(const LibrarySentence&) = delete;
+    LibrarySentences(const LibrarySentences&) = delete;
+    LibrarySentences& operator=(const LibrarySentences&) = delete;
 
     HRESULT QueryInterface(REFIID, void** out) override {
         *out = nullptr;
@@ -59,15 +60,16 @@ public:
     ULONG AddRef() override { return 1; }
     ULONG Release() override { return 1; }
     HRESULT PutString(aafCharacter_constptr sentence) override {
-        text_ = Utf8(sentence);
+        all_.push_back(Utf8(sentence));
         return AAFRESULT_SUCCESS;
     }
 
-    const std::string& text() const { return text_; }
+    const std::vector<std::string>& all() const { return all_; }
+    std::string last() const { return all_.empty() ? std::string() : all_.back(); }
 
 private:
     AAFSetDiagnosticOutputFunction set_;
-    std::string text_;
+    std::vector<std::string> all_;
 };
 
 // Makes a copy that can be written, whatever the permissions of its source.
@@ -129,8 +131,10 @@ AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
             kExitCaller, file,
             fmt::format("the module would not find this AAF library: it asks the system for {}",
                         kAAFLibraryName),
-            fmt::format("give the file that name and start again with LD_LIBRARY_PATH={}",
-                        DisplayPath(std::filesystem::absolute(file).parent_path())));
+            fmt::format(
+                "name a folder that can be written to in TMPDIR, or give the file that name "
+                "and start again with LD_LIBRARY_PATH={}",
+                DisplayPath(std::filesystem::absolute(file).parent_path())));
     }
 }
 
@@ -167,12 +171,12 @@ public:
         if (result >= 0) {
             return;
         }
-        if (const int error = SystemErrorIn(said_.text())) {
+        if (const int error = SystemErrorIn(said_.last())) {
             output_.Fail(error);
         }
         output_.TryPlace();
         const std::string reason =
-            said_.text().empty() ? library_.TextOfResult(result) : said_.text();
+            said_.last().empty() ? library_.TextOfResult(result) : said_.last();
         throw Failure(
             kExitCaller, path_,
             fmt::format(
@@ -184,7 +188,7 @@ private:
     const AafLibrary& library_;
     OutputFile& output_;
     const std::filesystem::path& path_;
-    const LibrarySentence said_;
+    const LibrarySentences said_;
 };
 
 void AafLibrary::Save(IAAFFile* file, const std::filesystem::path& path) const {
@@ -268,10 +272,15 @@ host::Ref<IAAFFile> AafLibrary::Open(const std::filesystem::path& path) const {
         throw Failure(problem);
     }
     const auto openRead = find<AAFFileOpenExistingReadFunction>("AAFFileOpenExistingRead");
+    const LibrarySentences said(find<AAFSetDiagnosticOutputFunction>("AAFSetDiagnosticOutput"));
     host::Ref<IAAFFile> file;
     const HRESULT result = openRead(WideName(path).c_str(), 0, file.Out());
     if (result < 0) {
         throw Failure(kExitFile, path, "can't be read as AAF: " + TextOfResult(result));
+    }
+    // What the library read all the same.
+    for (const std::string& sentence : said.all()) {
+        Notice("cliphost: {}: {}\n", DisplayPath(path), sentence);
     }
     return file;
 }

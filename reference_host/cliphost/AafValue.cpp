@@ -529,10 +529,48 @@ std::string ToText(const aafVersionType_t& version) {
     return std::to_string(version.major) + '.' + std::to_string(version.minor);
 }
 
+namespace {
+
+// A library gives what is no value of its property as bytes of no defined type.
+bool IsRaw(IAAFPropertyValue* value) {
+    aafBoolean_t isDefined = kAAFTrue;
+    return value != nullptr && value->IsDefinedType(&isDefined) >= 0 && isDefined == kAAFFalse;
+}
+
+class RawType final : public ValueType {
+public:
+    std::string Text(IAAFPropertyValue* value) override {
+        host::Ref<IAAFTypeDef> type;
+        value->GetType(type.Out());
+        const auto array = As<IAAFTypeDefVariableArray>(type.get());
+        aafUInt32 count = 0;
+        if (!array || array->GetCount(value, &count) < 0) {
+            return kUnreadable;
+        }
+        std::vector<aafUInt8> bytes(std::max<aafUInt32>(count, 1));
+        if (array->GetCArray(value, bytes.data(), count) < 0) {
+            return kUnreadable;
+        }
+        std::string text = "raw bytes";
+        for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
+            text += fmt::format(" {:02x}", bytes[i]);
+        }
+        return count <= kMostElements ? text : text + fmt::format(" ... {} in all", count);
+    }
+};
+
+}  // namespace
+
 ValueReader::ValueReader() = default;
 ValueReader::~ValueReader() = default;
 
 ValueType& ValueReader::TypeOf(IAAFPropertyValue* value) {
+    if (IsRaw(value)) {
+        if (!raw_) {
+            raw_ = std::make_unique<RawType>();
+        }
+        return *raw_;
+    }
     host::Ref<IAAFTypeDef> type;
     if (!value || value->GetType(type.Out()) < 0) {
         type.Reset();

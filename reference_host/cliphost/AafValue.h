@@ -28,7 +28,8 @@ public:
     ValueType& operator=(const ValueType&) = delete;
 
     // A value as text: numbers, names of enumerations, texts in quotes, records by their
-    // members, references to definitions by name. Anything that can't be read is "?".
+    // members, references to definitions by name; what is no value of its property as raw bytes.
+    // Anything that can't be read is "?".
     virtual std::string Text(IAAFPropertyValue* value) = 0;
     // Hands over the objects that a value owns, one after the other; false for a value of a
     // type that owns none.
@@ -51,6 +52,7 @@ public:
 
 private:
     std::unordered_map<IAAFTypeDef*, std::unique_ptr<ValueType>> types_{64};
+    std::unique_ptr<ValueType> raw_;
 };
 
 }  // namespace cliphost

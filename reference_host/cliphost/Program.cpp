@@ -11,6 +11,7 @@
 #include <system_error>
 
 #include "host_interfaces/Version.h"
+#include "host_interfaces/aaf/AAFExports.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
@@ -19,6 +20,7 @@
 #include "reference_host/cliphost/SettingsOptions.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/quicktime/MovieComponents.h"
+#include "reference_host/system/LibrarySearch.h"
 #include "reference_host/system/Process.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -91,6 +93,12 @@ int Run(int argc, char** argv) {
     app.add_option("--plugin", session.plugin,
                    "Use this module file instead of the one beside the program");
     app.add_option("--aaf-library", session.aafLibrary, "Use this build of the AAF library");
+
+    app.parse_complete_callback([&session] {
+        if (!session.aafLibrary.empty()) {
+            host::system::MakeFoundAs(session.aafLibrary, kAAFLibraryName);
+        }
+    });
 
     AddSettings(app, session.host);
 

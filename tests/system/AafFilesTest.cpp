@@ -3,9 +3,12 @@
 
 // Verbs about saved AAF files, and how what is saved names its media.
 
+#include <algorithm>
 #include <fstream>
+#include <functional>
 #include <nlohmann/json.hpp>
 
+#include "aaf_library/stored/StoredFile.h"
 #include "tests/system/Command.h"
 #include "tests/system/SystemTest.h"
 
@@ -73,6 +76,40 @@ TEST_F(DumpVerb, NeedsNoModule) {
     Copy("a.mov");
     ASSERT_EQ(Cliphost("describe -q " + In("in/a.mov") + " --aaf " + In("a.aaf")).status, 0);
     EXPECT_EQ(Cliphost("--plugin /nowhere.nvx dump " + In("a.aaf")).status, 0);
+}
+
+// One value of the wrong size: a name that was cut.
+TEST_F(DumpVerb, ShowsWhatMakesNoSenseAsRawBytes) {
+    Copy("a.mov");
+    ASSERT_EQ(Cliphost("describe -q " + In("in/a.mov") + " --aaf " + In("a.aaf")).status, 0);
+    aaf::stored::StoredObject root;
+    ASSERT_TRUE(aaf::stored::LoadTree(folder() / "a.aaf", root));
+    std::size_t cut = 0;
+    const std::function<void(aaf::stored::StoredObject&)> search =
+        [&](aaf::stored::StoredObject& object) {
+            for (aaf::stored::StoredProperty& property : object.properties) {
+                if (property.pid == 0x4001 && cut++ == 0) {  // of a locator, its URL
+                    property.bytes = {'f', 0, 'i'};
+                }
+                std::for_each(property.objects.begin(), property.objects.end(), search);
+            }
+        };
+    search(root);
+    ASSERT_GT(cut, 0u);
+    ASSERT_TRUE(
+        aaf::stored::SaveTree(root, folder() / "odd.aaf", aaf::stored::SectorSize::Bytes512));
+    const CommandResult dumped = Cliphost("dump --json " + In("odd.aaf") + " 2>" + In("told"));
+    EXPECT_EQ(dumped.status, 0);
+    std::set<std::string> urls;
+    Collect(Json::parse(dumped.out), "URLString", urls);
+    EXPECT_EQ(urls.count("raw bytes 66 00 69"), 1u) << dumped.out;
+    std::ifstream told(folder() / "told");
+    std::string line;
+    std::getline(told, line);
+    EXPECT_NE(line.find("odd.aaf: Content: Mobs: EssenceDescription: Locator: URLString: 3 bytes "
+                        "are no value of its type; it is kept as it stands"),
+              std::string::npos)
+        << line;
 }
 
 TEST_F(DumpVerb, TellsWhatIsNoAafFile) {

@@ -44,9 +44,37 @@ TEST_F(AafLibraryOption, TakesAnyFileThatCallsItselfByThePublishedName) {
     EXPECT_TRUE(fs::exists(saved));
 }
 
+TEST_F(AafLibraryOption, TakesAFileWithoutTheInnerNameByStartingAnew) {
+    const fs::path library = OtherBuild(folder(), false);
+    const fs::path temporary = folder() / "temporary";
+    fs::create_directory(temporary);
+    setenv("TMPDIR", temporary.c_str(), 1);
+    const fs::path saved = folder() / "saved.aaf";
+    const fs::path movie = Write(movies::Movie{{movies::VideoTrack({}, 10, 25, 1)}}, "m.mov");
+    const fs::path second = Write(movies::Movie{{movies::VideoTrack({}, 20, 25, 1)}}, "n.mov");
+    const std::string pinned = " --pin-time 2026-01-31T12:00:00Z";
+    const std::string option = "--aaf-library " + Quoted(library);
+    const CommandResult one = RunCliphost(option + " describe " + Quoted(movie) + " --aaf " +
+                                          Quoted(saved) + " --json" + pinned);
+    EXPECT_EQ(one.status, 0) << one.out;
+    EXPECT_TRUE(fs::exists(saved));
+    const CommandResult usual =
+        RunCliphost("describe " + Quoted(movie) + " --aaf " + Quoted(saved) + " --json" + pinned);
+    EXPECT_EQ(one.out, usual.out) << "arguments are passed on whole";
+    // Processes that read movies are started in the same way.
+    const CommandResult many =
+        RunCliphost("describe -q --jobs 2 --out-dir " + Quoted(folder() / "out") + ' ' + option +
+                    ' ' + Quoted(movie) + ' ' + Quoted(second));
+    EXPECT_EQ(many.status, 0) << many.out;
+    EXPECT_TRUE(fs::is_empty(temporary));
+    unsetenv("TMPDIR");
+}
+
 TEST_F(AafLibraryOption, RefusesAFileThatTheModuleWouldNotFind) {
     const fs::path library = OtherBuild(folder(), false);
+    setenv("TMPDIR", (folder() / "absent").c_str(), 1);
     const CommandResult run = RunCliphost("--aaf-library " + Quoted(library) + " plugin");
+    unsetenv("TMPDIR");
     EXPECT_EQ(run.status, 2);
     EXPECT_NE(run.out.find(library.string() + ": the module would not find this AAF library"),
               std::string::npos)

@@ -42,6 +42,29 @@ TEST_F(DataDefinitions, KindsConvertIntoEachOtherAndMatteIntoPictureOneWay) {
     EXPECT_FALSE(Converts(kAAFDataDef_Picture, kAAFDataDef_PictureWithMatte));
 }
 
+TEST_F(DataDefinitions, WithoutADescriptionHaveOneOfNoLength) {
+    const auto made = New(AUID_AAFParameterDefinition);
+    const auto definition = As<IAAFDefObject>(made);
+    aafUInt32 size = 9;
+    wchar_t text[4] = {};
+    EXPECT_EQ(definition->GetDescriptionBufLen(&size), AAFRESULT_SUCCESS);
+    EXPECT_EQ(size, 0u);
+    EXPECT_EQ(definition->GetDescription(text, sizeof text), AAFRESULT_PROP_NOT_PRESENT);
+    EXPECT_EQ(definition->GetDescriptionBufLen(nullptr), AAFRESULT_NULL_PARAM);
+    ASSERT_EQ(definition->SetDescription(L""), AAFRESULT_SUCCESS);
+    EXPECT_EQ(definition->GetDescriptionBufLen(&size), AAFRESULT_SUCCESS);
+    EXPECT_EQ(size, sizeof(wchar_t));
+
+    const auto meta = As<IAAFMetaDefinition>(Class(AUID_AAFFiller));
+    size = 9;
+    EXPECT_EQ(meta->GetDescriptionBufLen(&size), AAFRESULT_SUCCESS);
+    EXPECT_EQ(size, 0u);
+    EXPECT_EQ(meta->GetDescription(text, sizeof text), AAFRESULT_PROP_NOT_PRESENT);
+    ASSERT_EQ(meta->SetDescription(L"no"), AAFRESULT_SUCCESS);
+    EXPECT_EQ(meta->GetDescriptionBufLen(&size), AAFRESULT_SUCCESS);
+    EXPECT_EQ(size, 3 * sizeof(wchar_t));
+}
+
 TEST_F(DataDefinitions, IsDataDefOfAsksForTheSameId) {
     aafBoolean_t result = kAAFTrue;
     const auto legacy = As<IAAFDataDef>(Find(kAAFDataDef_LegacySound));

@@ -54,6 +54,36 @@ TEST_F(EnumerationTypes, OwnEnumerationsAreMade) {
     EXPECT_EQ(own->RegisterSize(3), AAFRESULT_BAD_SIZE);
 }
 
+// Programs name elements as their headers do, files without that prefix.
+TEST_F(EnumerationTypes, ElementsAreFoundWithAndWithoutTheirPrefix) {
+    const auto hint = TypeAs<IAAFTypeDefEnum>(kAAFTypeID_EditHintType);
+    for (const wchar_t* name : {L"RelativeLeft", L"kAAFRelativeLeft"}) {
+        const auto value = Out(hint, &IAAFTypeDefEnum::CreateValueFromName, name);
+        aafInt64 number = 0;
+        EXPECT_EQ(hint->GetIntegerValue(value.get(), &number), AAFRESULT_SUCCESS);
+        EXPECT_EQ(number, 2);
+    }
+    IAAFPropertyValue* out = nullptr;
+    EXPECT_EQ(hint->CreateValueFromName(L"kAAF", &out), AAFRESULT_ILLEGAL_VALUE);
+    EXPECT_EQ(hint->CreateValueFromName(L"kAAFkAAFRelativeLeft", &out), AAFRESULT_ILLEGAL_VALUE);
+    EXPECT_EQ(hint->CreateValueFromName(L"Relative", &out), AAFRESULT_ILLEGAL_VALUE);
+
+    const auto own = NewMeta<IAAFTypeDefEnum>(AUID_AAFTypeDefEnum);
+    wchar_t prefixed[] = L"kAAFOwn";
+    aafString_t names[] = {prefixed};
+    aafInt64 values[] = {7};
+    ASSERT_EQ(own->Initialize(kOwnId, Type(kAAFTypeID_Int16).get(), values, names, 1, L"Own"),
+              AAFRESULT_SUCCESS);
+    Out(own, &IAAFTypeDefEnum::CreateValueFromName, L"Own");
+    Out(own, &IAAFTypeDefEnum::CreateValueFromName, L"kAAFOwn");
+
+    ASSERT_EQ(usage->AppendElement(kOwnId, L"Usage_Own"), AAFRESULT_SUCCESS);
+    const auto value = Out(usage, &IAAFTypeDefExtEnum::CreateValueFromName, L"kAAFUsage_Own");
+    aafUID_t id{};
+    EXPECT_EQ(usage->GetAUIDValue(value.get(), &id), AAFRESULT_SUCCESS);
+    EXPECT_TRUE(id == kOwnId);
+}
+
 TEST_F(EnumerationTypes, ExtendibleOnesGrow) {
     wchar_t name[20] = {};
     EXPECT_EQ(usage->GetNameFromAUID(kOwnId, name, sizeof name), AAFRESULT_ILLEGAL_VALUE);

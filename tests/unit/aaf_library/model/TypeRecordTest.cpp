@@ -66,6 +66,19 @@ TEST_F(RecordTypes, MemberOutsideTheStructureIsRefused) {
     EXPECT_EQ(record->RegisterMembers(far, 4, 32), AAFRESULT_ILLEGAL_VALUE);
 }
 
+TEST_F(RecordTypes, LayoutsOfMembersAreRegisteredFirst) {
+    const auto inner = NewBox();
+    ASSERT_EQ(dictionary->RegisterTypeDef(As<IAAFTypeDef>(inner).get()), AAFRESULT_SUCCESS);
+    const auto outer = NewMeta<IAAFTypeDefRecord>(AUID_AAFTypeDefRecord);
+    const auto member = As<IAAFTypeDef>(inner);
+    IAAFTypeDef* types[] = {member.get()};
+    ASSERT_EQ(outer->Initialize(kOtherOwnId, types, names, 1, L"Outer"), AAFRESULT_SUCCESS);
+    aafUInt32 zero = 0;
+    EXPECT_EQ(outer->RegisterMembers(&zero, 1, 32), AAFRESULT_NOT_REGISTERED);
+    ASSERT_EQ(inner->RegisterMembers(offsets, 4, 32), AAFRESULT_SUCCESS);
+    EXPECT_EQ(outer->RegisterMembers(&zero, 1, 32), AAFRESULT_SUCCESS);
+}
+
 TEST_F(RecordTypes, LayoutOfAMemberThatGrewIsNoticed) {
     const auto inner = NewBox();
     ASSERT_EQ(inner->RegisterMembers(offsets, 4, 32), AAFRESULT_SUCCESS);

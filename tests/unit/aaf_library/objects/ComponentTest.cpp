@@ -274,6 +274,23 @@ TEST_F(Sequence, DoesNotMixEventsWithOthers) {
     EXPECT_EQ(AAFRESULT_EVENT_SEMANTICS, sequence->AppendComponent(marker));
 }
 
+TEST_F(Sequence, TakesEventsWithoutALength) {
+    Ptr<IAAFSequence> sequence = Make<IAAFSequence>(AUID_AAFSequence);
+    Ptr<IAAFComponent> marker = Make<IAAFComponent>(AUID_AAFCommentMarker);
+    Ptr<IAAFComponent> longer = Make<IAAFComponent>(AUID_AAFCommentMarker);
+    longer->SetLength(3);
+    ASSERT_EQ(AAFRESULT_SUCCESS, sequence->AppendComponent(marker));
+    aafLength_t length = 0;
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, As<IAAFComponent>(sequence)->GetLength(&length));
+    ASSERT_EQ(AAFRESULT_SUCCESS, sequence->AppendComponent(longer));
+    EXPECT_EQ(3, LengthOf(sequence));
+    ASSERT_EQ(AAFRESULT_SUCCESS, sequence->RemoveComponentAt(0));
+    EXPECT_EQ(3, LengthOf(sequence));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT,
+              Make<IAAFSequence>(AUID_AAFSequence)
+                  ->AppendComponent(Make<IAAFComponent>(AUID_AAFSourceClip)));
+}
+
 TEST_F(Sequence, GivesAndRemovesComponentsByPlace) {
     Ptr<IAAFSequence> sequence = Make<IAAFSequence>(AUID_AAFSequence);
     Ptr<IAAFComponent> parts[] = {Filler(1), Filler(2), Filler(4)};

@@ -271,8 +271,15 @@ TEST_F(Descriptor, OfSamplesNeedsItsOwnInitialize) {
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, pcm->SetBlockAlign(4));
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, pcm->GetBlockAlign(&align));
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, pcm->SetAverageBPS(4));
-    EXPECT_EQ(AAFRESULT_SUCCESS, sound->SetChannelCount(2));
-    EXPECT_EQ(AAFRESULT_SUCCESS, sound->SetQuantizationBits(24));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetChannelCount(2));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetQuantizationBits(24));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetAudioSamplingRate({48000, 1}));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetCompression({}));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetIsLocked(kAAFTrue));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetElectroSpatialFormulation(1));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetAudioRefLevel(1));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetDialNorm(1));
+    EXPECT_EQ(0u, Get(sound, &IAAFSoundDescriptor::GetChannelCount));
     EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFFileDescriptor>(pcm)->SetLength(5));
 
     EXPECT_EQ(AAFRESULT_SUCCESS, pcm->Initialize());
@@ -281,6 +288,8 @@ TEST_F(Descriptor, OfSamplesNeedsItsOwnInitialize) {
     EXPECT_EQ(0u, Get(sound, &IAAFSoundDescriptor::GetQuantizationBits));
     EXPECT_EQ(0, Get(pcm, &IAAFPCMDescriptor::GetBlockAlign));
     EXPECT_EQ(0u, Get(pcm, &IAAFPCMDescriptor::GetAverageBPS));
+    EXPECT_EQ(AAFRESULT_SUCCESS, sound->SetChannelCount(2));
+    EXPECT_EQ(2u, Get(sound, &IAAFSoundDescriptor::GetChannelCount));
     EXPECT_EQ(AAFRESULT_SUCCESS, pcm->SetBlockAlign(6));
     EXPECT_EQ(6, Get(pcm, &IAAFPCMDescriptor::GetBlockAlign));
     EXPECT_EQ(kAAFFalse, Get(pcm, &IAAFPCMDescriptor::AreAllPeakEnvelopePropertiesPresent));

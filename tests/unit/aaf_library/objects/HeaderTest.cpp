@@ -255,6 +255,32 @@ TEST_F(Header, TellsWhoWroteTheFile) {
     EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->NextOne(found.Out()));
 }
 
+TEST_F(Header, HasIdentificationsThatTellNothingBeforeInitialize) {
+    Ptr<IAAFIdentification> fresh = Make<IAAFIdentification>(AUID_AAFIdentification);
+    aafCharacter text[20] = {};
+    aafUInt32 size = 0;
+    aafProductVersion_t version{};
+    aafTimeStamp_t date{};
+    aafUID_t id{};
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetCompanyName(text, sizeof text));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetCompanyNameBufLen(&size));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetProductName(text, sizeof text));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetProductNameBufLen(&size));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetProductVersionString(text, sizeof text));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetProductVersionStringBufLen(&size));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetProductVersion(&version));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetProductID(&id));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetDate(&date));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetRefImplVersion(&version));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetPlatform(text, sizeof text));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetPlatformBufLen(&size));
+    EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, fresh->GetGenerationID(&id));
+    ASSERT_EQ(AAFRESULT_SUCCESS, fresh->Initialize(L"C", L"P", L"V", id));
+    EXPECT_EQ(AAFRESULT_SUCCESS, fresh->GetProductName(text, sizeof text));
+    EXPECT_EQ(AAFRESULT_SUCCESS, fresh->GetGenerationID(&id));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, fresh->GetProductVersion(&version));
+}
+
 TEST_F(Header, DoesWithoutTheOptionalPartsOfAnIdentification) {
     Product product;
     product.ident.productVersion = nullptr;

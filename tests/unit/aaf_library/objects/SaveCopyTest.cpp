@@ -241,8 +241,13 @@ TEST_F(TargetOfACopy, CanBeCopiedItself) {
     const std::wstring path = Path("second.aaf");
     Ptr<IAAFFile> second = NewFile(path);
     ASSERT_EQ(AAFRESULT_SUCCESS, target_->SaveCopyAs(second));
-    EXPECT_TRUE(Content(path_) == Content(path));
     ExpectThreeMobs(second);
+    // The same as by way of a copy of each mob.
+    const std::wstring other = Path("third.aaf");
+    Ptr<IAAFFile> third = NewFile(other);
+    Get(third, &IAAFFile::GetHeader);
+    ASSERT_EQ(AAFRESULT_SUCCESS, target_->SaveCopyAs(third));
+    EXPECT_TRUE(Content(other) == Content(path));
 }
 
 TEST_F(TargetOfACopy, SeveralTargetsOfOneSourceKeepTheirs) {
@@ -346,7 +351,7 @@ TEST_F(SaveCopy, ChangesAnExistingFileAndSaysWho) {
     Ptr<IAAFFile> file;
     ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, file.Out()));
     Ptr<IAAFHeader> header = Get(file, &IAAFFile::GetHeader);
-    EXPECT_EQ(2u, Get(header, &IAAFHeader::CountIdentifications));
+    EXPECT_EQ(3u, Get(header, &IAAFHeader::CountIdentifications));
     Ptr<IAAFMob> mob = Get(header, &IAAFHeader::LookupMob, MobId(1));
     EXPECT_EQ(L"changed", TextOf<IAAFMob>(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
 }
@@ -404,6 +409,53 @@ TEST_F(SaveCopy, CarriesEssence) {
     Ptr<IAAFHeader> header = Get(read, &IAAFFile::GetHeader);
     ASSERT_EQ(AAFRESULT_SUCCESS, header->LookupEssenceData(MobId(1), data.Out()));
     EXPECT_EQ(100000, Get(data, &IAAFEssenceData::GetSize));
+}
+
+namespace {
+
+std::vector<std::wstring> Writers(const Ptr<IAAFFile>& file) {
+    Ptr<IEnumAAFIdentifications> all =
+        Get(Get(file, &IAAFFile::GetHeader), &IAAFHeader::GetIdentifications);
+    std::vector<std::wstring> names;
+    Ptr<IAAFIdentification> one;
+    while (all->NextOne(one.Out()) == AAFRESULT_SUCCESS) {
+        names.push_back(TextOf<IAAFIdentification>(one, &IAAFIdentification::GetProductNameBufLen,
+                                                   &IAAFIdentification::GetProductName));
+    }
+    return names;
+}
+
+}  // namespace
+
+// Who made the description stands behind who saved it.
+TEST_F(SaveCopy, KeepsTheIdentificationsOfItsSource) {
+    DescribeClip();
+    wchar_t name[] = L"Saver";
+    product_.ident.productName = name;
+    Copy(Path("one.aaf"));
+    Ptr<IAAFFile> one;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(Path("one.aaf").c_str(), 0, one.Out()));
+    EXPECT_EQ((std::vector<std::wstring>{L"Saver", L"Tests"}), Writers(one));
+    aafUID_t made{};
+    aafUID_t kept{};
+    Get(Get(file_, &IAAFFile::GetHeader), &IAAFHeader::GetLastIdentification)
+        ->GetGenerationID(&made);
+    Get(Get(one, &IAAFFile::GetHeader), &IAAFHeader::GetLastIdentification)->GetGenerationID(&kept);
+    EXPECT_EQ(made, kept);
+
+    // Through a target that somebody looked at, which takes another way.
+    wchar_t again[] = L"Saver again";
+    product_.ident.productName = again;
+    Ptr<IAAFFile> target = NewFile(Path("two.aaf"));
+    EXPECT_EQ((std::vector<std::wstring>{L"Saver again"}), Writers(target));
+    ASSERT_EQ(AAFRESULT_SUCCESS, one->SaveCopyAs(target));
+    const std::vector<std::wstring> three{L"Saver again", L"Saver", L"Tests"};
+    EXPECT_EQ(three, Writers(target));
+    ASSERT_EQ(AAFRESULT_SUCCESS, target->Close());
+    Ptr<IAAFFile> two;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(Path("two.aaf").c_str(), 0, two.Out()));
+    EXPECT_EQ(three, Writers(two));
+    EXPECT_EQ((std::vector<std::wstring>{L"Saver", L"Tests"}), Writers(one));
 }
 
 }  // namespace aaf_test

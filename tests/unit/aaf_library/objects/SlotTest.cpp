@@ -202,11 +202,49 @@ TEST_F(SourceMob, AppendsSlotsOfTimecodeAndEdgecode) {
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(2, slot.Out()));
     EXPECT_EQ(L"Edgecode", NameOf(slot));
     Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
+    Ptr<IAAFComponent> only = Get(As<IAAFSequence>(segment), &IAAFSequence::GetComponentAt, 0u);
     aafEdgecode_t code{};
-    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFEdgecode>(segment)->GetEdgecode(&code));
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFEdgecode>(only)->GetEdgecode(&code));
     EXPECT_EQ(5, code.startFrame);
     EXPECT_EQ(kAAFFt35MM, code.filmKind);
     EXPECT_EQ('B', code.header[1]);
+}
+
+TEST_F(SourceMob, ExtendsTheTimecodeAndEdgecodeThatASlotHas) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFSourceMob);
+    Ptr<IAAFSourceMob> source = As<IAAFSourceMob>(mob);
+    aafUInt8 header[8] = {};
+    for (const aafFrameLength_t length : {100, 20}) {
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  source->AppendTimecodeSlot({25, 1}, 1, aafTimecode_t{length, 0, 25}, length));
+        EXPECT_EQ(AAFRESULT_SUCCESS, source->AppendEdgecodeSlot({24, 1}, 2, 5, length, kAAFFt35MM,
+                                                                kAAFEtKeycode, header));
+    }
+    EXPECT_EQ(2u, Get(mob, &IAAFMob::CountSlots));
+    for (const aafSlotID_t id : {1u, 2u}) {
+        Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, id);
+        Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
+        Ptr<IAAFSequence> sequence = As<IAAFSequence>(segment);
+        EXPECT_EQ(2u, Get(sequence, &IAAFSequence::CountComponents));
+        EXPECT_EQ(120, Get(As<IAAFComponent>(segment), &IAAFComponent::GetLength));
+        aafUID_t kind{};
+        As<IAAFDefObject>(Get(As<IAAFComponent>(segment), &IAAFComponent::GetDataDef))
+            ->GetAUID(&kind);
+        EXPECT_EQ(id == 1 ? kAAFDataDef_LegacyTimecode : kAAFDataDef_Edgecode, kind);
+    }
+    Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, 1u);
+    Ptr<IAAFSegment> segment = Get(slot, &IAAFMobSlot::GetSegment);
+    Ptr<IAAFComponent> second = Get(As<IAAFSequence>(segment), &IAAFSequence::GetComponentAt, 1u);
+    aafTimecode_t timecode{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFTimecode>(second)->GetTimecode(&timecode));
+    EXPECT_EQ(20, timecode.startFrame);
+    // Edgecode is no timecode, and a clip is no sequence.
+    EXPECT_EQ(AAFRESULT_INVALID_DATADEF,
+              source->AppendEdgecodeSlot({24, 1}, 1, 5, 9, kAAFFt35MM, kAAFEtKeycode, header));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              source->AddNilReference(3, 10, DataDef(kAAFDataDef_LegacyPicture), {25, 1}));
+    EXPECT_EQ(AAFRESULT_OBJECT_ALREADY_ATTACHED,
+              source->AppendTimecodeSlot({25, 1}, 3, aafTimecode_t{0, 0, 25}, 10));
 }
 
 TEST_F(SourceMob, IsReachedFromAMasterMob) {

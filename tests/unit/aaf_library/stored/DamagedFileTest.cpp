@@ -128,9 +128,13 @@ TEST(DamagedFile, OfTheOtherByteOrderIsRefused) {
     EXPECT_EQ(refusal(FileWithProperties({0x41, 0x20, 0, 0})), "unknown byte order");
 }
 
-TEST(DamagedFile, WithAPropertyTwiceIsRefused) {
-    const Bytes twice = {0x4C, 0x20, 2, 0, 2, 0x44, 0x82, 0, 1, 0, 2, 0x44, 0x82, 0, 1, 0, 7, 7};
-    EXPECT_EQ(refusal(FileWithProperties(twice)), "property 4402: occurs twice");
+TEST(DamagedFile, APropertyThatComesTwiceCountsOnce) {
+    const Bytes twice = {0x4C, 0x20, 2, 0, 2, 0x44, 0x82, 0, 1, 0, 2, 0x44, 0x82, 0, 1, 0, 7, 8};
+    const StoredObject tree = ReadTree(FileWithProperties(twice));
+    ASSERT_EQ(tree.properties.size(), 2u);
+    EXPECT_EQ(tree.Find(0x4402)->bytes, Bytes{7});
+    EXPECT_EQ(tree.Find(0x4402)->problem, "");
+    EXPECT_EQ(tree.properties[1].problem, "occurs twice");
 }
 
 TEST(DamagedFile, WithAPropertyOfNoBytesIsReadWithoutIt) {
@@ -198,13 +202,59 @@ TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
     EXPECT_EQ(refusal(file), "property 1901: a set has a key twice");
 }
 
-TEST(DamagedFile, WithAWeakReferenceBeyondTheTableIsRefused) {
+TEST(DamagedFile, AWeakReferenceThatMakesNoSenseIsKeptAsItStands) {
     Bytes reference = {7, 0, 0x01, 0x1B, 16};
     reference.resize(21);
-    EXPECT_EQ(refusal(FileWithProperties(OneProperty(0x0201, 0x02, reference))),
-              "property 0201: a weak reference has tag 7, the file has 0 paths");
-    EXPECT_EQ(refusal(FileWithProperties(OneProperty(0x0201, 0x02, {7, 0}))),
-              "property 0201: 2 bytes wanted, 0 left");
+    Bytes longKey = {0, 0, 0x01, 0x1B, 17};
+    longKey.resize(22);
+    const std::pair<Bytes, std::string> kept[] = {
+        {reference, "a weak reference has tag 7, the file has 0 paths"},
+        {Bytes{7, 0}, "2 bytes wanted, 0 left"},
+        {longKey, "a weak reference has tag 0, the file has 0 paths"},
+    };
+    for (const auto& [value, problem] : kept) {
+        const Bytes file = FileWithProperties(OneProperty(0x0201, 0x02, value));
+        const StoredObject tree = ReadTree(file);
+        ASSERT_EQ(tree.properties.size(), 1u) << problem;
+        EXPECT_EQ(tree.properties[0].problem, problem);
+        EXPECT_EQ(tree.properties[0].bytes, value) << problem;
+        EXPECT_EQ(ReadTree(WriteTree(tree, SectorSize::Bytes512)), tree) << problem;
+    }
+}
+
+TEST(DamagedFile, WeakReferencesWithABrokenIndexAreKeptAsTheyStand) {
+    const Bytes properties = OneProperty(0x001C, 0x12, name(u"MemberTypes-1c"));
+    const StoredObject without = ReadTree(FileWithProperties(properties));
+    EXPECT_EQ(without.properties.at(0).problem, "\"MemberTypes-1c index\" is missing");
+    EXPECT_TRUE(without.properties[0].bytes.empty());
+    const StoredObject cut = ReadTree(FileWith([&](CompoundFileWriter& writer) {
+        writer.AddStream(kRoot, u"properties", properties);
+        writer.AddStream(kRoot, u"MemberTypes-1c index", {1, 0, 0});
+    }));
+    EXPECT_EQ(cut.properties.at(0).problem, "4 bytes wanted, 3 left");
+    EXPECT_EQ(cut.properties[0].bytes, (Bytes{1, 0, 0}));
+    for (const StoredObject& tree : {without, cut}) {
+        EXPECT_EQ(ReadTree(WriteTree(tree, SectorSize::Bytes512)), tree);
+    }
+}
+
+TEST(DamagedFile, AStreamThatIsMissingIsKeptByItsName) {
+    const Bytes value =
+        ByteWriter().AppendNumber(std::uint8_t{0x55}).AppendText(u"Data-2702").bytes();
+    const StoredObject tree = ReadTree(FileWithProperties(OneProperty(0x2702, 0x42, value)));
+    EXPECT_EQ(tree.properties.at(0).problem, "\"Data-2702\" is missing");
+    EXPECT_EQ(tree.properties[0].name, u"Data");
+    EXPECT_EQ(ReadTree(WriteTree(tree, SectorSize::Bytes512)), tree);
+    const StoredObject unnamed = ReadTree(FileWithProperties(OneProperty(0x2702, 0x42, {0x55, 1})));
+    EXPECT_EQ(unnamed.properties.at(0).problem, "a name of 1 bytes");
+    EXPECT_EQ(unnamed.properties[0].bytes, (Bytes{0x55, 1}));
+    EXPECT_EQ(ReadTree(WriteTree(unnamed, SectorSize::Bytes512)), unnamed);
+}
+
+TEST(DamagedFile, APropertyOfAnUnknownFormIsKeptAsItStands) {
+    const StoredObject tree = ReadTree(FileWithProperties(OneProperty(0x4402, 0x40, {1, 2, 3})));
+    EXPECT_EQ(tree.properties.at(0).bytes, (Bytes{1, 2, 3}));
+    EXPECT_EQ(ReadTree(WriteTree(tree, SectorSize::Bytes512)), tree);
 }
 
 TEST(DamagedFile, WithATableOfWeakReferencesThatLiesIsRefused) {

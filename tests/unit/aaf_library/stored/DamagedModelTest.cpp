@@ -9,9 +9,11 @@
 #include "aaf_library/stored/TreeReader.h"
 #include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFTypeIds.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
 #include <gtest/gtest.h>
+#include <algorithm>
 #include <functional>
 #include <random>
 
@@ -27,8 +29,9 @@ StoredObject SampleTree() {
 
 std::string refusal(const StoredObject& tree) {
     const RefPtr<Model> model = sample::NewModel();
+    std::vector<std::string> notes;
     try {
-        ReadModel(tree, *model);
+        ReadModel(tree, *model, notes);
         return "";
     } catch (const StoredError& problem) {
         return problem.what();
@@ -61,10 +64,53 @@ StoredProperty& types(StoredObject& tree) {
     return property(property(tree, 1).objects.front(), meta::kTypeDefinitions);
 }
 
+using Notes = std::vector<std::string>;
+
+sample::SampleModel read(const StoredObject& tree) {
+    sample::SampleModel sample;
+    sample.model = sample::NewModel();
+    sample.header = ReadModel(tree, *sample.model, sample.notes);
+    return sample;
+}
+
+// The place of an element in a set.
+std::size_t IndexOf(const StoredProperty& set, const GUID& id) {
+    const StoredAuid stored = AuidOf(id);
+    const Bytes key(stored.begin(), stored.end());
+    const auto at = std::find(set.keys.begin(), set.keys.end(), key);
+    if (at == set.keys.end()) {
+        throw std::logic_error("no such element");
+    }
+    return static_cast<std::size_t>(at - set.keys.begin());
+}
+
+// The tree as it is after a reader and a writer of objects have had it.
+StoredObject passed(const StoredObject& tree) {
+    const sample::SampleModel sample = read(tree);
+    StoredObject again = TreeOfModel(*sample.model, *sample.header);
+    // Through bytes, as a file would go.
+    return ReadTree(WriteTree(again, SectorSize::Bytes512));
+}
+
+// The value that callers get of a property that was kept.
+PropertyValue& shown(Object& object, const PropertyKey& key) {
+    PropertyValue* const found = object.values().Find(key.pid);
+    if (found == nullptr) {
+        throw std::logic_error("no such value");
+    }
+    return *found;
+}
+
+bool IsDefined(PropertyValue& value) {
+    aafBoolean_t defined = kAAFTrue;
+    EXPECT_GE(value.IsDefinedType(&defined), 0);
+    return defined == kAAFTrue;
+}
+
 }  // namespace
 
 TEST(DamagedModel, TheSampleItselfIsRead) {
-    EXPECT_EQ(refusal(SampleTree()), "");
+    EXPECT_EQ(read(SampleTree()).notes, Notes());
 }
 
 TEST(DamagedModel, WithoutItsMainPartsIsRefused) {
@@ -80,57 +126,234 @@ TEST(DamagedModel, WithoutItsMainPartsIsRefused) {
     EXPECT_EQ(refusal(tree), "has no content");
 }
 
-TEST(DamagedModel, WithAnObjectOfAnUnknownClassIsRefused) {
+TEST(DamagedModel, WithAHeaderOfAnotherClassIsRefused) {
     StoredObject tree = SampleTree();
-    FirstSlot(tree).classId[0] ^= 0xFF;
-    EXPECT_EQ(refusal(tree), "Content: Mobs: Slots: an object of a class that is not defined");
-}
-
-TEST(DamagedModel, WithAnObjectInThePlaceOfAnotherKindIsRefused) {
-    StoredObject tree = SampleTree();
-    FirstSlot(tree).classId = AuidOf(AUID_AAFFiller);
-    EXPECT_EQ(refusal(tree),
-              "Content: Mobs: Slots: an object of the class Filler in a place for others");
-    tree = SampleTree();
     header(tree).classId = AuidOf(AUID_AAFFiller);
     EXPECT_EQ(refusal(tree), "an object of the class Filler in a place for others");
 }
 
-TEST(DamagedModel, WithADefinitionOfTheMetaModelAmongTheObjectsIsRefused) {
-    StoredObject tree = SampleTree();
-    FirstSlot(tree).classId = AuidOf(ncfGuid("0D010101-0201-0000-060E-2B3402060101"));
-    EXPECT_NE(refusal(tree), "");
+TEST(DamagedModel, AnObjectThatDoesNotFitIsKeptWithAllThatStandsBesideIt) {
+    const StoredAuid changed = AuidOf(ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4EFF"));
+    const std::pair<StoredAuid, std::string> others[] = {
+        {changed, "an object of a class that is not defined"},
+        {AuidOf(AUID_AAFFiller), "an object of the class Filler in a place for others"},
+        {AuidOf(AUID_AAFClassDef), "an object of a class that is not defined"},
+    };
+    for (const auto& [classId, problem] : others) {
+        StoredObject tree = SampleTree();
+        FirstSlot(tree).classId = classId;
+        const sample::SampleModel sample = read(tree);
+        EXPECT_EQ(sample.notes,
+                  Notes{"Content: Mobs: Slots: " + problem + "; it is kept as it stands"});
+        Object& mob = sample::mob(*sample.header, 0);
+        EXPECT_EQ(mob.CountObjects(prop::Mob_Slots), 0u);
+        EXPECT_FALSE(IsDefined(shown(mob, prop::Mob_Slots)));
+        StoredObject again = passed(tree);
+        EXPECT_EQ(property(mobs(again).objects.front(), prop::Mob_Slots.pid),
+                  property(mobs(tree).objects.front(), prop::Mob_Slots.pid));
+        StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+        EXPECT_EQ(mobs(again), mobs(before));
+    }
 }
 
-TEST(DamagedModel, WithAValueOfTheWrongSizeIsRefused) {
+TEST(DamagedModel, AValueOfTheWrongSizeIsKeptAsItStands) {
     StoredObject tree = SampleTree();
     property(FirstSlot(tree), prop::TimelineMobSlot_EditRate.pid).bytes.pop_back();
-    EXPECT_EQ(refusal(tree), "Content: Mobs: Slots: EditRate: 7 bytes are no value of its type");
-    tree = SampleTree();
-    property(FirstSlot(tree), prop::MobSlot_SlotName.pid).bytes.pop_back();
-    EXPECT_NE(refusal(tree).find("SlotName: "), std::string::npos);
+    property(FirstSlot(tree), prop::MobSlot_SlotName.pid).bytes = {'a', 0, 'b'};
+    const sample::SampleModel sample = read(tree);
+    EXPECT_EQ(sample.notes, (Notes{"Content: Mobs: Slots: SlotName: 3 bytes are no value of its "
+                                   "type; it is kept as it stands",
+                                   "Content: Mobs: Slots: EditRate: 7 bytes are no value of its "
+                                   "type; it is kept as it stands"}));
+    Object& slot = sample::slot(sample::mob(*sample.header, 0), 0);
+    aafRational_t rate{};
+    EXPECT_EQ(slot.ReadStruct(prop::TimelineMobSlot_EditRate, &rate), AAFRESULT_PROP_NOT_PRESENT);
+    PropertyValue& value = shown(slot, prop::MobSlot_SlotName);
+    EXPECT_FALSE(IsDefined(value));
+    EXPECT_EQ(value.bytes(), (Bytes{'a', 0, 'b'}));
+    EXPECT_EQ(value.type().id(), kAAFTypeID_UInt8Array);
+    EXPECT_EQ(passed(tree), ReadTree(WriteTree(tree, SectorSize::Bytes512)));
+    // Whoever sets the property has it.
+    EXPECT_GE(slot.PutString(prop::MobSlot_SlotName, L"new"), 0);
+    EXPECT_EQ(slot.StringOr(prop::MobSlot_SlotName, L""), L"new");
+    EXPECT_TRUE(IsDefined(shown(slot, prop::MobSlot_SlotName)));
 }
 
-TEST(DamagedModel, WithAValueInAnotherFormIsRefused) {
-    StoredObject tree = SampleTree();
-    property(FirstSlot(tree), prop::MobSlot_SlotName.pid).form = StoredForm::Stream;
-    EXPECT_EQ(refusal(tree),
-              "Content: Mobs: Slots: SlotName: is stored in another form than its type has");
+TEST(DamagedModel, AValueInAnotherFormIsKeptAsItStands) {
+    for (const StoredForm form : {StoredForm::Stream, StoredForm(0x40), StoredForm(0x86)}) {
+        StoredObject tree = SampleTree();
+        StoredProperty& name = property(FirstSlot(tree), prop::MobSlot_SlotName.pid);
+        name.form = form;
+        name.name = form == StoredForm::Stream ? u"SlotName" : u"";
+        const sample::SampleModel sample = read(tree);
+        EXPECT_EQ(sample.notes, Notes{"Content: Mobs: Slots: SlotName: is stored in another form "
+                                      "than its type has; it is kept as it stands"});
+        EXPECT_EQ(passed(tree), ReadTree(WriteTree(tree, SectorSize::Bytes512)));
+    }
 }
 
-TEST(DamagedModel, WithAKeyThatDiffersFromItsElementIsRefused) {
+// Objects of the file's own classes, with the file's own numbers, where a text should be.
+TEST(DamagedModel, ObjectsInThePlaceOfAValueAreKept) {
     StoredObject tree = SampleTree();
+    StoredObject& descriptor =
+        property(mobs(tree).objects.front(), prop::SourceMob_EssenceDescription.pid)
+            .objects.front();
+    const StoredProperty* locators = descriptor.Find(prop::EssenceDescriptor_Locator.pid);
+    ASSERT_NE(locators, nullptr);
+    StoredProperty odd = *locators;
+    odd.pid = prop::MobSlot_SlotName.pid;
+    odd.name = u"SlotName";
+    property(FirstSlot(tree), prop::MobSlot_SlotName.pid) = odd;
+    const StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+    const auto other = [](std::uint16_t pid) {
+        return static_cast<std::uint16_t>(pid < 0x8000 ? pid : pid - 0x1000);
+    };
+    const std::function<void(StoredObject&)> renumber = [&](StoredObject& object) {
+        for (StoredProperty& entry : object.properties) {
+            entry.pid = other(entry.pid);
+            if (entry.pid == meta::kLocalIdentification && entry.bytes[1] >= 0x80) {
+                entry.bytes[1] = static_cast<std::uint8_t>(entry.bytes[1] - 0x10);
+            }
+            for (StoredObject& contained : entry.objects) {
+                renumber(contained);
+            }
+        }
+    };
+    renumber(tree);
+    EXPECT_EQ(passed(tree), before);
+}
+
+TEST(DamagedModel, AWeakReferenceToNothingIsKeptAsItStands) {
+    StoredObject tree = SampleTree();
+    StoredObject& segment = property(FirstSlot(tree), prop::MobSlot_Segment.pid).objects.front();
+    property(segment, prop::Component_DataDefinition.pid).keys.front()[0] ^= 0xFF;
+    const sample::SampleModel sample = read(tree);
+    EXPECT_EQ(sample.notes,
+              Notes{"Content: Mobs: Slots: Segment: DataDefinition: a weak reference to what the "
+                    "file does not have; it is kept as it stands"});
+    StoredObject again = passed(tree);
+    EXPECT_EQ(property(FirstSlot(again), prop::MobSlot_Segment.pid),
+              property(FirstSlot(tree), prop::MobSlot_Segment.pid));
+}
+
+TEST(DamagedModel, AnElementsOwnKeyCounts) {
+    StoredObject tree = SampleTree();
+    const StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
     mobs(tree).keys.front()[31] ^= 0xFF;
-    EXPECT_EQ(refusal(tree), "Content: Mobs: an element whose key differs from that in the index");
+    EXPECT_EQ(read(tree).notes, Notes{"Content: Mobs: an element whose key differs from that in "
+                                      "the index; its own counts"});
+    EXPECT_EQ(passed(tree), before);
 }
 
-TEST(DamagedModel, AValueThatNothingDescribesIsPassedOver) {
+TEST(DamagedModel, TheKeyInTheIndexCountsForAnElementWithout) {
     StoredObject tree = SampleTree();
+    const StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+    StoredObject& mob = mobs(tree).objects.front();
+    mob.properties.erase(
+        std::find_if(mob.properties.begin(), mob.properties.end(),
+                     [](const StoredProperty& at) { return at.pid == prop::Mob_MobID.pid; }));
+    EXPECT_EQ(read(tree).notes,
+              Notes{"Content: Mobs: an element without a key; that in the index counts"});
+    EXPECT_EQ(passed(tree), before);
+}
+
+TEST(DamagedModel, TwoElementsOfOneKeyAreKeptAsTheyStand) {
+    StoredObject tree = SampleTree();
+    StoredProperty& set = mobs(tree);
+    property(set.objects[1], prop::Mob_MobID.pid).bytes = set.keys[0];
+    const sample::SampleModel sample = read(tree);
+    EXPECT_EQ(sample.notes.back(),
+              "Content: Mobs: two elements have one key; it is kept as it stands");
+    StoredObject again = passed(tree);
+    EXPECT_EQ(mobs(again).objects, set.objects);
+    EXPECT_EQ(mobs(again).keys, set.keys);
+}
+
+TEST(DamagedModel, ADefinitionThatDoesNotFitIsLeftOutAlone) {
+    StoredObject tree = SampleTree();
+    StoredObject& dictionary = property(header(tree), prop::Header_Dictionary.pid).objects.front();
+    StoredProperty& containers = property(dictionary, prop::Dictionary_ContainerDefinitions.pid);
+    const std::size_t own = IndexOf(containers, sample::kOwnDefinitionId);
+    containers.objects.at(own).classId = AuidOf(AUID_AAFFiller);
+    const sample::SampleModel sample = read(tree);
+    ASSERT_FALSE(sample.notes.empty());
+    EXPECT_EQ(sample.notes.front(),
+              "ContainerDefinitions: an object of the class Filler in a "
+              "place for others; it is left out");
+    EXPECT_EQ(sample.model->FindTarget(AUID_AAFContainerDef, sample::kOwnDefinitionId), nullptr);
+}
+
+TEST(DamagedModel, AValueThatNothingDescribesIsLeftOut) {
+    StoredObject tree = SampleTree();
+    const StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
     StoredProperty odd;
     odd.pid = 0x9000;
     odd.bytes = {1, 2, 3};
     FirstSlot(tree).properties.push_back(odd);
-    EXPECT_EQ(refusal(tree), "");
+    EXPECT_EQ(read(tree).notes, Notes{"Content: Mobs: Slots: TimelineMobSlot: property 9000 is "
+                                      "defined nowhere; it is left out"});
+    EXPECT_EQ(passed(tree), before);
+}
+
+TEST(DamagedModel, APropertyThatComesTwiceCountsOnce) {
+    StoredObject tree = SampleTree();
+    const StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+    StoredProperty twice = property(FirstSlot(tree), prop::MobSlot_SlotID.pid);
+    twice.problem = "occurs twice";
+    FirstSlot(tree).properties.push_back(twice);
+    EXPECT_EQ(read(tree).notes,
+              Notes{"Content: Mobs: Slots: SlotID: occurs twice; it is left out"});
+    EXPECT_EQ(passed(tree), before);
+}
+
+TEST(DamagedModel, NotesOfOneFileAreLimited) {
+    StoredObject tree = SampleTree();
+    for (std::uint16_t i = 0; i < 150; ++i) {
+        StoredProperty odd;
+        odd.pid = static_cast<std::uint16_t>(0x9000 + i);
+        odd.bytes = {1};
+        FirstSlot(tree).properties.push_back(odd);
+    }
+    const Notes notes = read(tree).notes;
+    ASSERT_EQ(notes.size(), 101u);
+    EXPECT_EQ(notes.back(), "and 50 more of the kind");
+}
+
+// One definition that makes no sense costs no more than itself.
+TEST(DamagedModel, ADefinitionWithoutANameIsLeftOut) {
+    StoredObject tree = SampleTree();
+    const auto erase = [](StoredProperty& set, const GUID& id, std::uint16_t pid) {
+        StoredObject& object = set.objects.at(IndexOf(set, id));
+        object.properties.erase(
+            std::find_if(object.properties.begin(), object.properties.end(),
+                         [pid](const StoredProperty& at) { return at.pid == pid; }));
+    };
+    erase(types(tree), kAAFTypeID_Rational, meta::kName);
+    erase(property(property(tree, 1).objects.front(), meta::kClassDefinitions),
+          AUID_AAFTimelineMobSlot, meta::kName);
+    const sample::SampleModel sample = read(tree);
+    EXPECT_EQ(sample.notes,
+              (Notes{"meta-dictionary: a class is left out: property 0006 is missing",
+                     "meta-dictionary: a type is left out: property 0006 is missing"}));
+}
+
+TEST(DamagedModel, APropertyWithoutATypeIsTakenAsBytes) {
+    StoredObject tree = SampleTree();
+    StoredProperty& set = types(tree);
+    const auto at = static_cast<std::ptrdiff_t>(IndexOf(set, sample::kQuadTypeId));
+    set.objects.erase(set.objects.begin() + at);
+    set.keys.erase(set.keys.begin() + at);
+    const sample::SampleModel sample = read(tree);
+    ASSERT_EQ(sample.notes.size(), 1u);
+    EXPECT_NE(sample.notes[0].find("has no type and is taken as bytes"), std::string::npos);
+    const PropertyDefinition* area = sample.model->FindProperty(sample::kQuadPropertyId);
+    ASSERT_NE(area, nullptr);
+    EXPECT_EQ(area->typeId(), kAAFTypeID_UInt8Array);
+    Object* descriptor =
+        sample::mob(*sample.header, 0).ObjectAt(prop::SourceMob_EssenceDescription);
+    Object* picture = descriptor->ObjectAt(prop::MultipleDescriptor_FileDescriptors, 0);
+    EXPECT_EQ(picture->FindValue(area->key())->bytes().size(), 32u);
+    EXPECT_NO_THROW(passed(tree));
 }
 
 TEST(DamagedModel, TypesThatAreMadeOfThemselvesAreLeftOut) {
@@ -189,9 +412,9 @@ TEST(DamagedModel, AnArrayTypeLargerThanAnyValueIsLeftOut) {
     StoredProperty& set = types(tree);
     set.objects.push_back(huge.Find(meta::kTypeDefinitions)->objects.front());
     set.keys.push_back(huge.Find(meta::kTypeDefinitions)->keys.front());
-    const RefPtr<Model> model = sample::NewModel();
-    ReadModel(tree, *model);
-    EXPECT_EQ(model->FindType(type.id), nullptr);
+    const sample::SampleModel model = read(tree);
+    EXPECT_EQ(model.model->FindType(type.id), nullptr);
+    EXPECT_EQ(model.notes, Notes{"the type Huge makes no sense and is left out"});
 }
 
 // Every number, key, name and value of the tree changed in turn.
@@ -201,16 +424,22 @@ TEST(DamagedModel, WithARandomChangeIsReadOrRefusedButNeverHarms) {
     std::mt19937 random(seed);
     const Bytes file = WriteTree(SampleTree(), SectorSize::Bytes512);
     int refused = 0;
+    int odd = 0;
     for (int round = 0; round < 300; ++round) {
         Bytes damaged = file;
         for (int i = 0; i < 8; ++i) {
             damaged[512 + random() % (damaged.size() - 512)] = static_cast<std::uint8_t>(random());
         }
         try {
-            refused += refusal(ReadTree(damaged)).empty() ? 0 : 1;
+            const sample::SampleModel sample = read(ReadTree(damaged));
+            odd += sample.notes.empty() ? 0 : 1;
+            // What was read can be written and read again.
+            read(ReadTree(
+                WriteTree(TreeOfModel(*sample.model, *sample.header), SectorSize::Bytes512)));
         } catch (const StoredError&) {
             ++refused;
         }
     }
     EXPECT_GT(refused, 5);
+    EXPECT_GT(odd, 5);
 }

@@ -54,6 +54,13 @@ std::string refusal(const StoredObject& dictionary) {
     }
 }
 
+// Why the only type is left out.
+std::string note(const StoredObject& dictionary) {
+    const MetaRecords records = ReadMetaDictionary(dictionary);
+    EXPECT_TRUE(records.types.empty());
+    return records.notes.size() == 1 ? records.notes.front() : "";
+}
+
 StoredProperty& FirstType(StoredObject& dictionary, std::uint16_t pid) {
     for (StoredProperty& property : dictionary.properties[1].objects[0].properties) {
         if (property.pid == pid) {
@@ -121,7 +128,7 @@ TEST(MetaDictionary, LaysOutARecordTypeByteForByte) {
         return reader.entry(storage).contained.at(name);
     };
     const std::uint32_t definition = inside(
-        inside(CompoundFileReader::kRootIndex, u"MetaDictionary-1"), u"TypeDefinitions-4{0}");
+        inside(CompoundFileReader::kRootIndex, u"MetaDictionary-1"), u"TypeDefinitions-4{50}");
     EXPECT_EQ(GuidOf(reader.entry(definition).classId),
               ncfGuid("0D010101-020D-0000-060E-2B3402060101"));
 
@@ -154,26 +161,27 @@ TEST(MetaDictionary, DefinitionsOfAnUnknownKindArePassedOver) {
     EXPECT_TRUE(ReadMetaDictionary(dictionary).types.empty());
 }
 
-TEST(MetaDictionary, ADefinitionWithoutNameOrIdIsRefused) {
+TEST(MetaDictionary, ADefinitionWithoutNameOrIdIsLeftOut) {
     StoredObject dictionary = StoredMetaDictionary(OneType(quad()));
     FirstType(dictionary, meta::kName).pid = 0x7000;
-    EXPECT_EQ(refusal(dictionary), "meta-dictionary: property 0006 is missing");
+    EXPECT_EQ(note(dictionary), "meta-dictionary: a type is left out: property 0006 is missing");
     dictionary = StoredMetaDictionary(OneType(quad()));
     FirstType(dictionary, meta::kIdentification).bytes.pop_back();
-    EXPECT_EQ(refusal(dictionary), "meta-dictionary: an id of 15 bytes");
+    EXPECT_EQ(note(dictionary), "meta-dictionary: a type is left out: an id of 15 bytes");
 }
 
-TEST(MetaDictionary, NamesAndMembersThatDoNotPairAreRefused) {
+TEST(MetaDictionary, NamesAndMembersThatDoNotPairAreLeftOut) {
     StoredObject dictionary = StoredMetaDictionary(OneType(quad()));
     FirstType(dictionary, meta::kRecordMemberTypes).keys.pop_back();
-    EXPECT_EQ(refusal(dictionary), "meta-dictionary: 4 names for 3 members");
+    EXPECT_EQ(note(dictionary), "meta-dictionary: a type is left out: 4 names for 3 members");
     dictionary = StoredMetaDictionary(OneType(quad()));
     Bytes& names = FirstType(dictionary, meta::kRecordMemberNames).bytes;
     names.resize(names.size() - 2);
-    EXPECT_EQ(refusal(dictionary), "meta-dictionary: property 001d ends within a name");
+    EXPECT_EQ(note(dictionary),
+              "meta-dictionary: a type is left out: property 001d ends within a name");
 }
 
-TEST(MetaDictionary, AValueOfTheWrongSizeIsRefused) {
+TEST(MetaDictionary, AValueOfTheWrongSizeIsLeftOut) {
     TypeFacts type;
     type.id = kQuadId;
     type.name = L"Odd";
@@ -181,7 +189,35 @@ TEST(MetaDictionary, AValueOfTheWrongSizeIsRefused) {
     type.size = 3;
     StoredObject dictionary = StoredMetaDictionary(OneType(type));
     FirstType(dictionary, meta::kFixedArrayCount).bytes.pop_back();
-    EXPECT_EQ(refusal(dictionary), "meta-dictionary: 4 bytes wanted, 3 left");
+    EXPECT_EQ(note(dictionary), "meta-dictionary: a type is left out: 4 bytes wanted, 3 left");
+}
+
+TEST(MetaDictionary, OnlyTheOddPropertyOfAClassIsLeftOut) {
+    MetaRecords records;
+    MetaClass entry;
+    entry.id = kQuadId;
+    entry.name = L"Example";
+    entry.parent = kQuadId;
+    for (const GUID& id : {kQuadId, kRationalId}) {
+        MetaProperty property;
+        property.id = id;
+        property.name = L"Property";
+        property.pid = 0xFFFF;
+        property.type = kRationalId;
+        entry.properties.push_back(property);
+    }
+    records.classes.push_back(entry);
+    StoredObject dictionary = StoredMetaDictionary(records);
+    for (StoredProperty& set : dictionary.properties[0].objects[0].properties) {
+        if (set.pid == meta::kProperties) {
+            set.objects[0].properties.clear();
+        }
+    }
+    const MetaRecords read = ReadMetaDictionary(dictionary);
+    ASSERT_EQ(read.classes.size(), 1u);
+    EXPECT_EQ(read.classes[0].properties.size(), 1u);
+    EXPECT_EQ(read.notes, std::vector<std::string>{"meta-dictionary: a property of Example is left "
+                                                   "out: property 0005 is missing"});
 }
 
 TEST(MetaDictionary, WithoutItsSetsItIsRefused) {

@@ -41,7 +41,7 @@ Bytes BytesOf(const sample::SampleModel& sample, SectorSize size = SectorSize::B
 sample::SampleModel reread(const Bytes& file) {
     sample::SampleModel sample;
     sample.model = sample::NewModel();
-    sample.header = ReadModel(ReadTree(file), *sample.model);
+    sample.header = ReadModel(ReadTree(file), *sample.model, sample.notes);
     return sample;
 }
 
@@ -314,7 +314,7 @@ TEST(ModelFile, LocalNumbersOfAnotherWriterAreTranslated) {
     ASSERT_NE(tree, original);
     sample::SampleModel read;
     read.model = sample::NewModel();
-    read.header = ReadModel(tree, *read.model);
+    read.header = ReadModel(tree, *read.model, read.notes);
     EXPECT_EQ(TreeOfModel(*read.model, *read.header), original);
 }
 
@@ -357,13 +357,39 @@ TEST(ModelFile, EssenceIsKeptAsAStream) {
     }
 }
 
-TEST(ModelFile, OnlyDefinitionsThatAreReferredToOrOwnAreStored) {
+TEST(ModelFile, DefinitionsOfDataAreStoredAndThoseThatAreReferredToOrOwn) {
     const sample::SampleModel sample = sample::WholeModel();
     const StoredObject tree = TreeOfModel(*sample.model, *sample.header);
     const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
-    EXPECT_EQ(dictionary.Find(prop::Dictionary_DataDefinitions.pid)->objects.size(), 3u);
+    EXPECT_EQ(dictionary.Find(prop::Dictionary_DataDefinitions.pid)->objects.size(), 11u);
     EXPECT_EQ(dictionary.Find(prop::Dictionary_ContainerDefinitions.pid)->objects.size(), 2u);
     EXPECT_EQ(dictionary.Find(prop::Dictionary_OperationDefinitions.pid), nullptr);
+}
+
+// Programs that extend a file look for any of them.
+TEST(ModelFile, AllDefinitionsOfDataAreStoredWhetherLookedUpOrNot) {
+    for (const bool isLookedUp : {false, true}) {
+        const sample::SampleModel sample = sample::EmptyModel();
+        if (isLookedUp) {
+            EXPECT_EQ(sample.model->dictionary().CountObjects(prop::Dictionary_DataDefinitions),
+                      11u);
+        }
+        const StoredObject tree = ReadTree(BytesToSave(sample));
+        const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
+        const StoredProperty& set = *dictionary.Find(prop::Dictionary_DataDefinitions.pid);
+        std::size_t at = 0;
+        std::vector<BuiltInDefinition> sorted(BuiltInDataDefinitions().begin(),
+                                              BuiltInDataDefinitions().end());
+        std::sort(sorted.begin(), sorted.end(),
+                  [](const auto& a, const auto& b) { return AuidOf(a.id) < AuidOf(b.id); });
+        ASSERT_EQ(set.objects.size(), sorted.size());
+        for (const BuiltInDefinition& entry : sorted) {
+            EXPECT_EQ(set.objects[at], StoredDataDefinition(entry)) << entry.name;
+            ++at;
+        }
+        EXPECT_EQ(tree, ReadTree(BytesOf(sample)));
+        EXPECT_EQ(StoredClasses(tree).count(L"DataDefinition"), 1u);
+    }
 }
 
 TEST(ModelFile, TheMetaDictionaryHoldsWhatIsUsedAndIsClosed) {
@@ -495,4 +521,180 @@ TEST(ModelFile, SavesAndLoadsByPathAndNamesThePathInErrors) {
     RefPtr<Object> header;
     EXPECT_EQ(LoadModel(folder / "absent.aaf", *model, header).failure, FileFailure::NotThere);
     EXPECT_FALSE(header);
+}
+
+namespace {
+
+// Changes what a stored file says of a definition in one of the sets of its meta-dictionary.
+StoredObject& definition(StoredObject& root, std::uint16_t set, const GUID& id) {
+    for (StoredProperty& property : root.properties.at(0).objects.at(0).properties) {
+        if (property.pid != set) {
+            continue;
+        }
+        const StoredAuid key = AuidOf(id);
+        for (std::size_t i = 0; i < property.keys.size(); ++i) {
+            if (std::equal(key.begin(), key.end(), property.keys[i].begin())) {
+                return property.objects[i];
+            }
+        }
+    }
+    throw std::logic_error("no such definition");
+}
+
+StoredProperty& changed(StoredObject& object, std::uint16_t pid) {
+    for (StoredProperty& property : object.properties) {
+        if (property.pid == pid) {
+            return property;
+        }
+    }
+    throw std::logic_error("no such property");
+}
+
+void AppendName(Bytes& names, const std::u16string& name) {
+    for (char16_t unit : name + u'\0') {
+        names.push_back(static_cast<std::uint8_t>(unit));
+        names.push_back(static_cast<std::uint8_t>(unit >> 8));
+    }
+}
+
+Bytes StoredNameOf(const std::u16string& name) {
+    Bytes bytes;
+    AppendName(bytes, name);
+    return bytes;
+}
+
+sample::SampleModel fromTree(const StoredObject& tree) {
+    sample::SampleModel sample;
+    sample.model = sample::NewModel();
+    sample.header = ReadModel(tree, *sample.model, sample.notes);
+    return sample;
+}
+
+}  // namespace
+
+// Most programs store the parameters of an effect so, whatever their type says.
+TEST(ModelFile, AVectorTakesASetOfObjects) {
+    const sample::SampleModel sample = sample::WholeModel();
+    const StoredObject original = TreeOfModel(*sample.model, *sample.header);
+    StoredObject tree = original;
+    std::size_t found = 0;
+    const std::function<void(StoredObject&)> change = [&](StoredObject& object) {
+        for (StoredProperty& property : object.properties) {
+            for (StoredObject& contained : property.objects) {
+                change(contained);
+            }
+            if (property.form == StoredForm::StrongVector && !property.objects.empty()) {
+                ++found;
+                property.form = StoredForm::StrongSet;
+                property.keyPid = 0x4C01;
+                for (std::size_t i = 0; i < property.objects.size(); ++i) {
+                    property.keys.emplace_back(16, static_cast<std::uint8_t>(i));
+                }
+            }
+        }
+    };
+    change(tree);
+    EXPECT_GT(found, 5u);
+    const sample::SampleModel read = fromTree(tree);
+    EXPECT_EQ(read.notes, std::vector<std::string>());
+    EXPECT_EQ(TreeOfModel(*read.model, *read.header), original);
+}
+
+TEST(ModelFile, ParametersAreStoredAsASetOfTheirDefinitions) {
+    const auto parametersOf = [](std::vector<GUID> definitions) {
+        const sample::SampleModel sample = sample::WholeModel();
+        const auto make = [&](const GUID& classId) {
+            return sample.model->CreateObject(*sample.model->FindClass(classId));
+        };
+        const RefPtr<Object> group = make(AUID_AAFOperationGroup);
+        for (const GUID& id : definitions) {
+            const RefPtr<Object> parameter = make(AUID_AAFConstantValue);
+            if (!(id == GUID{})) {
+                EXPECT_GE(parameter->PutStruct(prop::Parameter_Definition, id), 0);
+            }
+            EXPECT_GE(group->AppendObject(prop::OperationGroup_Parameters, parameter->Identity()),
+                      0);
+        }
+        Object& slot = sample::slot(sample::mob(*sample.header, 2), 0);
+        EXPECT_GE(slot.PutObject(prop::MobSlot_Segment, group->Identity()), 0);
+        const sample::SampleModel read = reread(BytesOf(sample));
+        EXPECT_EQ(read.notes, std::vector<std::string>());
+        Object* again =
+            sample::slot(sample::mob(*read.header, 2), 0).ObjectAt(prop::MobSlot_Segment);
+        EXPECT_EQ(again->CountObjects(prop::OperationGroup_Parameters), definitions.size());
+        const StoredObject tree = TreeOfModel(*read.model, *read.header);
+        const StoredObject& content = child(child(tree, 2), prop::Header_Content.pid);
+        const StoredObject& stored =
+            child(child(child(content, prop::ContentStorage_Mobs.pid, 2), prop::Mob_Slots.pid),
+                  prop::MobSlot_Segment.pid);
+        return *stored.Find(prop::OperationGroup_Parameters.pid);
+    };
+    const StoredProperty set = parametersOf({sample::kQuadTypeId, sample::kOwnClassId});
+    EXPECT_EQ(set.form, StoredForm::StrongSet);
+    EXPECT_EQ(set.keyPid, prop::Parameter_Definition.pid);
+    EXPECT_EQ(set.keys.size(), 2u);
+    EXPECT_EQ(parametersOf({sample::kQuadTypeId, sample::kQuadTypeId}).form,
+              StoredForm::StrongVector);
+    EXPECT_EQ(parametersOf({sample::kQuadTypeId, GUID{}}).form, StoredForm::StrongVector);
+}
+
+TEST(ModelFile, AFilesOwnNamesOfTypesCount) {
+    const sample::SampleModel sample = sample::WholeModel();
+    StoredObject tree = TreeOfModel(*sample.model, *sample.header);
+    changed(definition(tree, meta::kTypeDefinitions, kAAFTypeID_Int64), meta::kName).bytes =
+        StoredNameOf(u"Int64");
+    const sample::SampleModel read = fromTree(tree);
+    EXPECT_EQ(read.notes, std::vector<std::string>());
+    EXPECT_EQ(read.model->FindType(kAAFTypeID_Int64)->name(), L"Int64");
+    EXPECT_EQ(BytesOf(read), WriteTree(tree, SectorSize::Bytes512));
+    EXPECT_EQ(reread(BytesToSave(read)).model->FindType(kAAFTypeID_Int64)->name(), L"Int64");
+    EXPECT_NE(sample::NewModel()->FindType(kAAFTypeID_Int64)->name(), L"Int64");
+}
+
+TEST(ModelFile, AFilesOwnMembersOfEnumerationsCount) {
+    const sample::SampleModel sample = sample::WholeModel();
+    StoredObject tree = TreeOfModel(*sample.model, *sample.header);
+    StoredObject& release = definition(tree, meta::kTypeDefinitions, kAAFTypeID_ProductReleaseType);
+    StoredProperty& names = changed(release, meta::kEnumerationNames);
+    StoredProperty& values = changed(release, meta::kEnumerationValues);
+    AppendName(names.bytes, u"VersionRumoured");
+    values.bytes.insert(values.bytes.end(), {9, 0, 0, 0, 0, 0, 0, 0});
+    StoredObject& usage = definition(tree, meta::kTypeDefinitions, kAAFTypeID_UsageType);
+    AppendName(changed(usage, meta::kExtendibleNames).bytes, u"Usage_Other");
+    const StoredAuid other = AuidOf(sample::kOwnPropertyId);
+    Bytes& ids = changed(usage, meta::kExtendibleValues).bytes;
+    ids.insert(ids.end(), other.begin(), other.end());
+
+    const sample::SampleModel read = fromTree(tree);
+    EXPECT_EQ(read.notes, std::vector<std::string>());
+    aafCharacter text[40] = {};
+    auto& enumeration =
+        dynamic_cast<IAAFTypeDefEnum&>(*read.model->FindType(kAAFTypeID_ProductReleaseType));
+    EXPECT_GE(enumeration.GetNameFromInteger(9, text, sizeof text), 0);
+    EXPECT_EQ(std::wstring(text), L"VersionRumoured");
+    EXPECT_GE(enumeration.GetNameFromInteger(4, text, sizeof text), 0);
+    EXPECT_EQ(std::wstring(text), L"VersionBeta");
+    auto& extendible =
+        dynamic_cast<IAAFTypeDefExtEnum&>(*read.model->FindType(kAAFTypeID_UsageType));
+    EXPECT_GE(extendible.GetNameFromAUID(sample::kOwnPropertyId, text, sizeof text), 0);
+    EXPECT_EQ(std::wstring(text), L"Usage_Other");
+    EXPECT_EQ(BytesOf(read), WriteTree(tree, SectorSize::Bytes512));
+    EXPECT_EQ(BytesToSave(read), WriteTree(tree, SectorSize::Bytes512));
+}
+
+TEST(ModelFile, WhatAFileRenamesCounts) {
+    const sample::SampleModel sample = sample::WholeModel();
+    StoredObject tree = TreeOfModel(*sample.model, *sample.header);
+    StoredObject& position = definition(tree, meta::kTypeDefinitions, kAAFTypeID_PositionType);
+    const StoredAuid shorter = AuidOf(kAAFTypeID_Int32);
+    changed(position, meta::kRenamedType).keys.at(0) = Bytes(shorter.begin(), shorter.end());
+    const sample::SampleModel read = fromTree(tree);
+    EXPECT_EQ(read.model->FindType(kAAFTypeID_PositionType)->StoredSize(), 4u);
+    // What the file has of the longer kind no longer fits, and stays.
+    EXPECT_FALSE(read.notes.empty());
+    const StoredObject again = TreeOfModel(*read.model, *read.header);
+    EXPECT_EQ(child(again, 2), child(tree, 2));
+
+    changed(position, meta::kRenamedType).keys.at(0)[0] ^= 0xFF;
+    EXPECT_EQ(fromTree(tree).model->FindType(kAAFTypeID_PositionType)->StoredSize(), 8u);
 }

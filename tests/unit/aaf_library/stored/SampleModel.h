@@ -6,6 +6,7 @@
 #include "aaf_library/model/Model.h"
 
 #include <string>
+#include <vector>
 
 // A model with a header that has everything a description of a movie file may
 // have: mobs of both kinds, slots, a sequence, source clips, a timecode,
@@ -27,6 +28,7 @@ RefPtr<Model> NewModel();
 struct SampleModel {
     RefPtr<Model> model;
     RefPtr<Object> header;
+    std::vector<std::string> notes = {};  // of reading it
 };
 
 SampleModel WholeModel();
