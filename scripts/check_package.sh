@@ -14,6 +14,8 @@ packages() {
     || { cat "$root.log" >&2; fail "dpkg $* failed"; }
   rm -f "$root.log"
 }
+things() { (cd "$root" && find . -path ./var/lib/dpkg -prune -o -print | sort); }
+before=$(things)
 packages --install "$package"
 
 program=$root/usr/bin/cliphost
@@ -45,6 +47,6 @@ printf '#include "host_interfaces/framework/PluginEntry.h"\n' \
   | g++ -std=c++17 -fsyntax-only $flags -x c++ - || fail "the headers do not compile"
 
 packages --purge cliphost
-left=$(cd "$root" && find . -path ./var/lib/dpkg -prune -o ! -type d -print)
+left=$(comm -13 <(printf '%s\n' "$before") <(things))
 [ -z "$left" ] || fail "the package leaves $left"
 printf 'the package installs, describes a movie, and leaves nothing when removed\n'

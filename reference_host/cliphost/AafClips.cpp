@@ -40,26 +40,11 @@ constexpr KindOfData kKinds[] = {
     {kAAFDataDef_Timecode, "timecode"}, {kAAFDataDef_LegacyTimecode, "timecode"},
 };
 
-std::string KindOfSlot(IAAFMobSlot& slot) {
-    host::Ref<IAAFDataDef> data;
-    aafUID_t id{};
-    slot.GetDataDef(data.Out());
-    const auto definition = As<IAAFDefObject>(data.get());
-    if (!definition || definition->GetAUID(&id) < 0) {
-        return "";
-    }
-    for (const KindOfData& kind : kKinds) {
-        if (kind.id == id) {
-            return kind.name;
-        }
-    }
-    return ToText(id);
-}
-
 SlotFacts FactsOfSlot(IAAFMobSlot& slot) {
     SlotFacts facts;
     slot.GetSlotID(&facts.id);
-    facts.kind = KindOfSlot(slot);
+    const SlotData data = DataOfSlot(slot);
+    facts.kind = !data.kind.empty() || data.id == aafUID_t{} ? data.kind : ToText(data.id);
     facts.rate = {0, 1};
     if (const auto timeline = As<IAAFTimelineMobSlot>(&slot)) {
         timeline->GetEditRate(&facts.rate);
@@ -280,6 +265,22 @@ private:
 };
 
 }  // namespace
+
+SlotData DataOfSlot(IAAFMobSlot& slot) {
+    SlotData found;
+    host::Ref<IAAFDataDef> data;
+    slot.GetDataDef(data.Out());
+    const auto definition = As<IAAFDefObject>(data.get());
+    if (!definition || definition->GetAUID(&found.id) < 0) {
+        return found;
+    }
+    for (const KindOfData& kind : kKinds) {
+        if (kind.id == found.id) {
+            found.kind = kind.name;
+        }
+    }
+    return found;
+}
 
 std::vector<AafClip> ClipsOf(IAAFFile* file) {
     return MobsOfFile(file).Clips();

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "host_interfaces/aaf/AAFFile.h"
+#include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 
 namespace cliphost {
@@ -30,6 +31,14 @@ struct AafClip {
     std::vector<aafMobID_t> sources;  // the mobs that it leads to, itself if it is no master
     std::vector<std::string> urls;    // what their locators hold, each once
 };
+
+// What a slot holds: the id of its data definition, and a name for it where it has one, such as
+// "picture"; else empty.
+struct SlotData {
+    aafUID_t id{};
+    std::string kind;
+};
+SlotData DataOfSlot(IAAFMobSlot& slot);
 
 // In the order of their names; a file keeps its mobs in that of their ids.
 std::vector<AafClip> ClipsOf(IAAFFile* file);

@@ -30,6 +30,7 @@ std::filesystem::path Bin::Add(IAAFFile* description, const std::filesystem::pat
     check(from->GetMobs(nullptr, mobs.Out()), "reading the description");
     check(file_->GetHeader(to.Out()), "reading the bin");
     std::filesystem::path same;
+    bool hasMore = false;
     host::Ref<IAAFMob> mob;
     while (mobs->NextOne(mob.Out()) >= 0) {
         aafMobID_t id{};
@@ -40,7 +41,7 @@ std::filesystem::path Bin::Add(IAAFFile* description, const std::filesystem::pat
             if (isMaster) {
                 same = movies_[KeyOf(id)];
             }
-            AddLocators(*mob, *there);
+            hasMore = AddLocators(*mob, *there) || hasMore;
             continue;
         }
         check(mob->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, file_.get(), there.Out()),
@@ -50,23 +51,32 @@ std::filesystem::path Bin::Add(IAAFFile* description, const std::filesystem::pat
             clips_.push_back(std::move(there));
         }
     }
-    return same;
+    return hasMore ? same : std::filesystem::path();
 }
 
-void Bin::AddLocators(IAAFMob& from, IAAFMob& to) {
-    std::set<std::string> known;
-    ForEachLocatorOf(to, [&](IAAFMob&, IAAFLocator& locator) { known.insert(PathOf(locator)); });
+// Whether there is one that was not there.
+bool Bin::AddLocators(IAAFMob& from, IAAFMob& to) {
+    aafMobID_t id{};
+    to.GetMobID(&id);
+    std::set<std::string>& known = urls_[KeyOf(id)];
+    if (known.empty()) {
+        ForEachLocatorOf(to,
+                         [&](IAAFMob&, IAAFLocator& locator) { known.insert(PathOf(locator)); });
+    }
+    bool hasMore = false;
     const auto source = As<IAAFSourceMob>(&to);
     host::Ref<IAAFEssenceDescriptor> descriptor;
     if (!source || source->GetEssenceDescriptor(descriptor.Out()) < 0) {
-        return;
+        return false;
     }
     ForEachLocatorOf(from, [&](IAAFMob&, IAAFLocator& locator) {
         const std::string url = PathOf(locator);
         if (known.insert(url).second) {
             AppendLocator(file_.get(), *descriptor, url);
+            hasMore = true;
         }
     });
+    return hasMore;
 }
 
 }  // namespace cliphost

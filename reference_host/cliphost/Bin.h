@@ -4,6 +4,7 @@
 
 #include <filesystem>
 #include <map>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -20,7 +21,7 @@ public:
     explicit Bin(const AafLibrary& library) : library_(library), file_(library.OpenTransient()) {}
 
     // Adds the mobs of a description. Throws a Failure when the library refuses. The movie that
-    // is there with the same content: its clip has one more locator now. Empty: there is none.
+    // is there with the same content, where its clip has one more place now. Empty: there is none.
     std::filesystem::path Add(IAAFFile* description, const std::filesystem::path& movie);
 
     IAAFFile* file() { return file_.get(); }
@@ -30,12 +31,13 @@ public:
     void Save(const std::filesystem::path& path) const { library_.Save(file_.get(), path); }
 
 private:
-    void AddLocators(IAAFMob& from, IAAFMob& to);
+    bool AddLocators(IAAFMob& from, IAAFMob& to);
 
     const AafLibrary& library_;
     host::Ref<IAAFFile> file_;
     std::vector<host::Ref<IAAFMob>> clips_;
     std::map<std::string, std::filesystem::path::string_type> movies_;  // by a mob's id
+    std::map<std::string, std::set<std::string>> urls_;  // of mobs with copies, by their ids
 };
 
 }  // namespace cliphost

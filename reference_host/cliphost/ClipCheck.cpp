@@ -99,7 +99,10 @@ void ClipCheck::Check(const std::vector<CheckedClip*>& clips) {
         const ClipPlace* const worst = clip->Telling();
         if (same == static_cast<std::ptrdiff_t>(clip->places.size()) && same > 0) {
             clip->state = ClipState::Same;
-        } else if (same > 0 || !clip->found.empty()) {
+        } else if (same > 0) {
+            // A place that can't be checked tells nothing against the one that leads there.
+            clip->state = worst->state == ClipState::Unknown ? ClipState::Same : ClipState::Moved;
+        } else if (!clip->found.empty()) {
             clip->state = ClipState::Moved;
         } else {
             clip->state = worst               ? worst->state

@@ -59,7 +59,14 @@ void AddDescribeForParent(CLI::App& app, const SessionOptions& session, int& sta
 void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
         app.add_subcommand("describe", "Describe movies as AAF: show the mob tree and save it");
-    verb->footer("Example: cliphost describe clip.mov --aaf clip.aaf");
+    verb->footer(
+        "Examples:\n"
+        "  cliphost describe clip.mov --aaf clip.aaf\n"
+        "  cliphost describe FOLDER --out-dir DIR --map /mnt/media=//server/media\n"
+        "  cliphost describe FOLDER --bin BIN.aaf --stringout\n"
+        "  cliphost describe FOLDER --out-dir DIR --recursive --extensions mov,mxf\n"
+        "  cliphost describe --files-from LIST --out-dir DIR --skip-done --jsonl\n"
+        "  cliphost describe --files-from LIST --out-dir DIR --shard 2/16");
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
     auto* const aaf =

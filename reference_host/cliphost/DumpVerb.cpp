@@ -27,7 +27,10 @@ void PrintTreeAsJson(const std::filesystem::path& file, const TreeNode& tree) {
 void AddDump(CLI::App& app, const SessionOptions& options) {
     auto* const verb =
         app.add_subcommand("dump", "Show the mob tree of an AAF file, whoever made it");
-    verb->footer("Example: cliphost dump clip.aaf");
+    verb->footer(
+        "Examples:\n"
+        "  cliphost dump clip.aaf\n"
+        "  cliphost dump clip.aaf --json");
     auto file = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);
     verb->add_option("file", *file, "The AAF file")->required();

@@ -8,6 +8,7 @@
 #include <unordered_set>
 
 #include "reference_host/cliphost/FolderTree.h"
+#include "reference_host/cliphost/Words.h"
 
 namespace cliphost {
 namespace {
@@ -223,6 +224,16 @@ void MoviePlan::EndLists() {
     for (const std::shared_ptr<FolderClips>& folder : folders_) {
         folder->EndList();
     }
+}
+
+bool MoviePlan::MayBeOutput(std::size_t place, const char* ending) const {
+    const std::uint32_t list = steps_[place].list;
+    // Letters' case counts on some disks, and on others it doesn't.
+    const auto endsSo = [&] {
+        const std::filesystem::path movie((*this)[place].movie);
+        return InSmallLetters(movie.extension().native()) == ending;
+    };
+    return list == kNamed || (list == kFound && endsSo());
 }
 
 std::filesystem::path OutputName(const std::filesystem::path& movie, unsigned number,

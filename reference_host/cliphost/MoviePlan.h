@@ -56,8 +56,9 @@ public:
     // Steps of other shares are not among them.
     std::size_t size() const { return steps_.size(); }
     MovieStep operator[](std::size_t place) const;
-    // Whether the caller named it, not a folder.
-    bool IsNamed(std::size_t place) const { return steps_[place].list == kNamed; }
+    // Whether an output that ends so may lie where the movie does: the caller named it, or it was
+    // found by such an ending. What the module lists is called *.mov.
+    bool MayBeOutput(std::size_t place, const char* ending) const;
     // 0: whichever is free.
     unsigned NumberOf(std::size_t place) const { return numbers_.empty() ? 0 : numbers_[place]; }
 

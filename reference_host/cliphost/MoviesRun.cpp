@@ -70,7 +70,7 @@ int MoviesRun::Run() {
     } else {
         RunHere();
     }
-    isStopped_ = signals && DelayedSignals::HaveCome();
+    isStopped_ = signals && DelayedSignals::HaveCome() && Left() > 0;
     Finish(done_, failed_);
     if (isStopped_) {
         TellStop();
@@ -144,6 +144,15 @@ void MoviesRun::Record(std::size_t place, const MovieStep& step,
     }
 }
 
+// Movies of the plan of which nothing is known yet.
+int MoviesRun::Left() const {
+    int all = 0;
+    for (std::size_t i = 0; i < plan().size(); ++i) {
+        all += plan()[i].notice ? 0 : 1;
+    }
+    return all - done_ - doneBefore_ - failed_;
+}
+
 void MoviesRun::TellStop() {
     if (DelayedSignals::Which() == SIGPIPE) {
         return;  // who reads what is printed has seen enough
@@ -153,14 +162,11 @@ void MoviesRun::TellStop() {
         Record(place, plan()[place], output, DoneMovies::Known::ByDate);
     }
     const bool goesOn = !options_.outFolder.empty() && canRecord_;
-    int all = 0;
-    for (std::size_t i = 0; i < plan().size(); ++i) {
-        all += plan()[i].notice ? 0 : 1;
-    }
     const int done = done_ + doneBefore_;
+    const int all = done + failed_ + Left();
     Notice("cliphost: stopped by signal {}: {} of {} done, {} failed, {} left{}\n",
            DelayedSignals::Which(), done, Counted(static_cast<std::uint64_t>(all), "movie"),
-           failed_, all - done - failed_, goesOn ? "; the same call with --skip-done goes on" : "");
+           failed_, Left(), goesOn ? "; the same call with --skip-done goes on" : "");
 }
 
 // It is written when all movies were read: none of them may be there.
@@ -312,18 +318,20 @@ void MoviesRun::Settle(std::size_t place, const MovieStep& step, const MovieAnsw
     Show(step.movie, answer, saved);
 }
 
-// The movies that the caller named by the files that they are.
-const MoviesRun::PlacesByFile& MoviesRun::Named() {
-    if (named_.empty()) {
+// The movies that an output may meet, by the files that they are.
+const MoviesRun::PlacesByFile& MoviesRun::Guarded() {
+    if (!guarded_) {
+        guarded_.emplace();
         for (std::size_t i = 0; i < plan().size(); ++i) {
-            const auto number =
-                plan().IsNamed(i) ? host::system::NumberOf(plan()[i].movie) : std::nullopt;
+            const auto number = plan().MayBeOutput(i, ending_)
+                                    ? host::system::NumberOf(plan()[i].movie)
+                                    : std::nullopt;
             if (number) {
-                named_.emplace(*number, i);
+                guarded_->emplace(*number, i);
             }
         }
     }
-    return named_;
+    return *guarded_;
 }
 
 std::filesystem::path MoviesRun::TargetFor(std::size_t place, const MovieStep& step) {
@@ -340,7 +348,8 @@ std::filesystem::path MoviesRun::TargetFor(std::size_t place, const MovieStep& s
     const auto inItsPlace = host::system::NumberOf(target);
     if (inItsPlace) {
         RefuseOutputOntoMovie(target, step.movie);
-        if (const auto other = Named().find(*inItsPlace); other != Named().end()) {
+        const PlacesByFile& guarded = Guarded();
+        if (const auto other = guarded.find(*inItsPlace); other != guarded.end()) {
             RefuseOutputOntoMovie(target, plan()[other->second].movie);
         }
     }

@@ -81,12 +81,13 @@ private:
     void Remember(std::size_t place, const MovieStep& step, const std::filesystem::path& saved);
     void Record(std::size_t place, const MovieStep& step, const std::filesystem::path& output,
                 DoneMovies::Known known);
+    int Left() const;
     void TellStop();
     // Does one movie; what it fails with is told, and the next one goes on.
     template <class Work>
     void GoOnAfterFailure(const std::filesystem::path& movie, const Work& work);
     using PlacesByFile = std::map<host::system::FileNumber, std::size_t>;
-    const PlacesByFile& Named();
+    const PlacesByFile& Guarded();
     std::filesystem::path TargetFor(std::size_t place, const MovieStep& step);
     const MoviePlan& plan() const { return *plan_; }
 
@@ -105,7 +106,7 @@ private:
     std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
     std::optional<Progress> progress_;
     std::set<std::string> targetsTaken_;  // names in the folder
-    PlacesByFile named_;
+    std::optional<PlacesByFile> guarded_;
     std::optional<DoneMovies> doneMovies_;
     bool canRecord_ = true;
     std::vector<std::pair<std::uint32_t, std::string>> outputs_;  // of places; for a stop

@@ -61,6 +61,7 @@ void TakeMachineFromPath(UrlPlace& place) {
         place.machine = path.substr(2, end - 2);
     }
     place.path = path.substr(end);
+    place.path = std::filesystem::path(place.path).lexically_normal().generic_string();
 }
 
 bool ReadPath(std::string text, UrlPlace& place) {
@@ -115,7 +116,7 @@ void PathMaps::Add(std::string_view rule) {
     std::string from(rule.substr(0, equals));
     if (!ReadPlace(from, added.here)) {
         // The module is given paths in this form.
-        added.here.path = std::filesystem::absolute(from).lexically_normal().string();
+        added.here.path = std::filesystem::absolute(from).lexically_normal().generic_string();
     }
     if (!ReadPlace(std::string(rule.substr(equals + 1)), added.there)) {
         refuse("TO is no absolute path",

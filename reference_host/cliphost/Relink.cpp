@@ -16,6 +16,7 @@
 #include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/FileNumber.h"
@@ -36,9 +37,10 @@ constexpr const char* kNamesOfRelinked[] = {"in place", "relinked", "cleaned", "
 struct RelinkPlan {
     const CheckedClip* checked = nullptr;
     Relinked what = Relinked::InPlace;
-    std::string url;               // of the movie, for where no locator leads to it
-    std::set<std::string> leads;   // locators that lead to it
-    std::set<std::string> strays;  // locators that lead nowhere, or to another movie
+    std::string url;                 // of the movie, for where no locator leads to it
+    std::vector<std::string> found;  // places for strays, one each
+    std::set<std::string> leads;     // locators that lead to it
+    std::set<std::string> strays;    // locators that lead nowhere, or to another movie
 };
 
 bool IsStray(const ClipPlace& place) {
@@ -58,15 +60,24 @@ RelinkPlan PlanOf(const CheckedClip& checked, PathMaps& maps) {
     }
     if (!checked.clip.isOurs) {
         plan.what = Relinked::OtherMaker;
-    } else if (!plan.leads.empty()) {
-        plan.what = plan.strays.empty() ? Relinked::InPlace : Relinked::Cleaned;
-        plan.url = *plan.leads.begin();
-    } else if (checked.found.empty()) {
-        plan.what = Relinked::NotMatched;
-    } else {
-        plan.what = Relinked::Linked;
-        plan.url = host::text::FileUrl(checked.found.front().native());
-        maps.MapToOther(plan.url);
+        return plan;
+    }
+    // A clip that names no place gets one, too.
+    const std::size_t needed = std::max<std::size_t>(plan.strays.size(), plan.leads.empty());
+    for (std::size_t i = 0; i < std::min(needed, checked.found.size()); ++i) {
+        plan.found.push_back(host::text::FileUrl(checked.found[i].native()));
+        maps.MapToOther(plan.found.back());
+        // Two folders here may be one there.
+        if (plan.strays.erase(plan.found.back()) > 0) {
+            plan.leads.insert(plan.found.back());
+        }
+    }
+    plan.what = !plan.found.empty()   ? Relinked::Linked
+                : plan.leads.empty()  ? Relinked::NotMatched
+                : plan.strays.empty() ? Relinked::InPlace
+                                      : Relinked::Cleaned;
+    if (!plan.found.empty() || !plan.leads.empty()) {
+        plan.url = plan.found.empty() ? *plan.leads.begin() : plan.found.front();
     }
     return plan;
 }
@@ -80,24 +91,31 @@ public:
     }
 
     void Do() {
-        std::optional<aafUInt32> kept;
+        const auto isStray = [&](const std::string& url) { return plan_.strays.count(url) != 0; };
         const auto leads = [&](const std::string& url) { return plan_.leads.count(url) != 0; };
-        if (count_ > 0 && !Find(leads)) {
+        const bool isInPlace = count_ == 0 || Find(leads).has_value();
+        std::size_t used = 0;
+        for (std::optional<aafUInt32> stray; used < plan_.found.size() && (stray = Find(isStray));
+             ++used) {
+            SetPath(*LocatorAt(*stray), plan_.found[used]);
+        }
+        if (!isInPlace && used == 0) {
             // One that can't be checked gives way only where there is no other.
-            kept = Find([&](const std::string& url) { return plan_.strays.count(url) != 0; });
-            kept = kept ? kept : Find([](const std::string& url) { return !url.empty(); });
+            const auto stray = Find(isStray);
+            const auto kept =
+                stray ? stray : Find([](const std::string& url) { return !url.empty(); });
             if (kept) {
                 SetPath(*LocatorAt(*kept), plan_.url);
             } else {
                 AppendLocator(file_, descriptor_, plan_.url);
             }
         }
-        for (aafUInt32 i = count_; i-- > 0;) {
-            if (kept != i && plan_.strays.count(PathOf(*LocatorAt(i))) != 0 &&
-                descriptor_.RemoveLocatorAt(i) < 0) {
-                throw Failure(kExitFile, PathOf(*LocatorAt(i)),
+        while (const std::optional<aafUInt32> stray = Find(isStray)) {
+            if (descriptor_.RemoveLocatorAt(*stray) < 0) {
+                throw Failure(kExitFile, PathOf(*LocatorAt(*stray)),
                               "the AAF library does not remove this locator");
             }
+            --count_;
         }
     }
 
@@ -140,27 +158,35 @@ void EditClip(IAAFFile* file, IAAFHeader& header, const RelinkPlan& plan) {
     }
 }
 
+std::string Removed(std::size_t strays) {
+    return fmt::format("{} removed that {} not lead to it", Counted(strays, "place"),
+                       strays == 1 ? "does" : "do");
+}
+
 std::string LineOfPlan(const RelinkPlan& plan) {
     const CheckedClip& checked = *plan.checked;
     const ClipPlace* const place = checked.Telling();
     std::string line = host::text::PrintableLines(checked.clip.name);
     switch (plan.what) {
         case Relinked::Linked: {
-            const std::filesystem::path& found = checked.found.front();
-            line += " -> " + host::DisplayPath(found);
-            if (plan.url != host::text::FileUrl(found.native())) {
-                line += ", written as " + plan.url;
+            const std::size_t used = plan.found.size();
+            for (std::size_t i = 0; i < checked.found.size(); ++i) {
+                const std::filesystem::path& found = checked.found[i];
+                line += (i == 0      ? " -> "
+                         : i == used ? "; the same content is in "
+                                     : ", ") +
+                        host::DisplayPath(found);
+                if (i < used && plan.found[i] != host::text::FileUrl(found.native())) {
+                    line += ", written as " + plan.found[i];
+                }
             }
-            for (std::size_t i = 1; i < checked.found.size(); ++i) {
-                line += fmt::format("{}{}", i == 1 ? "; the same content is in " : ", ",
-                                    host::DisplayPath(checked.found[i]));
+            if (plan.strays.size() > used) {
+                line += "; " + Removed(plan.strays.size() - used);
             }
             return line + "\n";
         }
         case Relinked::Cleaned:
-            return line + fmt::format(": {} removed that {} not lead to it\n",
-                                      Counted(plan.strays.size(), "place"),
-                                      plan.strays.size() == 1 ? "does" : "do");
+            return line + ": " + Removed(plan.strays.size()) + "\n";
         case Relinked::NotMatched:
             line += ": not matched: no movie in the folders has its content";
             return line + (place && !place->reason.empty()
@@ -192,6 +218,21 @@ ordered_json JsonOfPlan(const RelinkPlan& plan) {
     return json;
 }
 
+// What is no AAF file may be a movie that nobody had to look at.
+void RefuseOutputOntoOther(const AafLibrary& library, const std::filesystem::path& output) {
+    std::error_code ignored;
+    if (!std::filesystem::is_regular_file(output, ignored) ||
+        std::filesystem::file_size(output, ignored) == 0 || OutputFile::IsDevice(output)) {
+        return;
+    }
+    try {
+        library.Open(output);
+    } catch (const Failure&) {
+        throw Failure(kExitCaller, output, "there is a file that is no AAF file",
+                      "name another, or remove it");
+    }
+}
+
 }  // namespace
 
 int Relink(Session& session, RelinkOptions& options) {
@@ -210,6 +251,7 @@ int Relink(Session& session, RelinkOptions& options) {
             RefuseOutputOntoMovie(options.output, movie);
         }
     }
+    RefuseOutputOntoOther(session.aaf(), options.output);
 
     std::vector<RelinkPlan> plans;
     std::size_t counts[std::size(kNamesOfRelinked)] = {};

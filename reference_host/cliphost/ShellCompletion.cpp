@@ -1,5 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include <algorithm>
+
 #include "reference_host/cliphost/HelpWords.h"
 
 namespace cliphost {
@@ -27,6 +29,15 @@ std::string OptionNames(const HelpVerb& verb) {
         }
     }
     return names;
+}
+
+// Of those that take a value, which is no verb.
+std::string ValueOptionNames(const HelpVerb& verb) {
+    HelpVerb some = verb;
+    some.options.erase(std::remove_if(some.options.begin(), some.options.end(),
+                                      [](const HelpOption& one) { return !one.takesValue; }),
+                       some.options.end());
+    return OptionNames(some);
 }
 
 std::string VerbNames(const std::vector<HelpVerb>& verbs) {
@@ -64,8 +75,13 @@ _cliphost() {
     local current=${COMP_WORDS[COMP_CWORD]} verb= word
     local verbs=')" + VerbNames(verbs) +
                        R"('
+    local before=: valued=')" +
+                       ValueOptionNames(verbs.front()) +
+                       R"('
     for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
+        case " $valued " in *" $before "*) before=:; continue ;; esac
         case " $verbs " in *" $word "*) verb=$word; break ;; esac
+        before=$word
     done
     local options=')" + OptionNames(verbs.front()) +
                        R"('
@@ -92,15 +108,17 @@ complete -o default -F _cliphost cliphost
 std::string ZshCompletion(const std::vector<HelpVerb>& verbs) {
     std::string text =
         "#compdef cliphost\n# zsh completion for cliphost\n_cliphost() {\n"
-        "    local verb= word\n    local -a verbs options\n    verbs=(\n";
+        "    local verb= word before=:\n    local -a verbs options valued\n    verbs=(\n";
     for (const HelpVerb& verb : verbs) {
         text += verb.name.empty() ? "" : "        " + Described(verb.name, verb.text) + "\n";
     }
-    text +=
-        "    )\n    for word in \"${(@)words[2,CURRENT-1]}\"; do\n"
-        "        if (( ${verbs[(I)${word}:*]} )); then verb=$word; break; fi\n    done\n"
-        "    options=(\n" +
-        ZshOptions(verbs.front()) + "    )\n    case $verb in\n";
+    text += "    )\n    valued=(" + ValueOptionNames(verbs.front()) +
+            ")\n    for word in \"${(@)words[2,CURRENT-1]}\"; do\n"
+            "        if (( ${valued[(Ie)$before]} )); then before=:; continue; fi\n"
+            "        if (( ${verbs[(I)${word}:*]} )); then verb=$word; break; fi\n"
+            "        before=$word\n    done\n"
+            "    options=(\n" +
+            ZshOptions(verbs.front()) + "    )\n    case $verb in\n";
     for (const HelpVerb& verb : verbs) {
         if (!verb.name.empty()) {
             text += "    " + verb.name + ") options+=(\n" + ZshOptions(verb) + "        ) ;;\n";

@@ -6,16 +6,18 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstring>
+#include <limits>
 
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFComponents.h"
-#include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFTimecodes.h"
-#include "host_interfaces/util/NMAUtil.h"
+#include "reference_host/cliphost/AafClips.h"
 #include "reference_host/cliphost/AafQuery.h"
+#include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/Failure.h"
 #include "text/Encodings.h"
 
@@ -25,8 +27,6 @@ namespace {
 // Of editors' programs: a composition that is a sequence of its own, not a part of another.
 constexpr aafUID_t kTopLevel = ncfGuid("0D010102-0101-0700-060E-2B3404010101");
 constexpr aafFrameOffset_t kSecondsAtStart = 3600;
-
-enum class MediaKind { None, Picture, Sound };
 
 struct Part {
     aafSlotID_t slot;
@@ -50,23 +50,6 @@ struct Clip {
         return pictures.empty() ? most : pictures.front().frames;
     }
 };
-
-aafUID_t DataOf(IAAFMobSlot& slot) {
-    host::Ref<IAAFDataDef> data;
-    aafUID_t id{};
-    if (slot.GetDataDef(data.Out()) >= 0) {
-        if (const auto definition = As<IAAFDefObject>(data.get())) {
-            definition->GetAUID(&id);
-        }
-    }
-    return id;
-}
-
-MediaKind TrackOf(const aafUID_t& id) {
-    return id == kAAFDataDef_Picture || id == kAAFDataDef_LegacyPicture ? MediaKind::Picture
-           : id == kAAFDataDef_Sound || id == kAAFDataDef_LegacySound   ? MediaKind::Sound
-                                                                        : MediaKind::None;
-}
 
 // Whole frames of the sequence in a slot; 0 where it has no length.
 aafLength_t FramesIn(IAAFMobSlot& slot, const aafRational_t& rate) {
@@ -100,12 +83,11 @@ Clip ClipOf(IAAFMob& mob, const aafRational_t& rate) {
         if (mob.GetSlotAt(i, slot.Out()) < 0 || slot->GetSlotID(&id) < 0) {
             continue;
         }
-        const aafUID_t data = DataOf(*slot);
-        const MediaKind track = TrackOf(data);
-        const aafLength_t frames = track == MediaKind::None ? 0 : FramesIn(*slot, rate);
+        const SlotData data = DataOfSlot(*slot);
+        const bool isPicture = data.kind == "picture";
+        const aafLength_t frames = isPicture || data.kind == "sound" ? FramesIn(*slot, rate) : 0;
         if (frames > 0) {
-            (track == MediaKind::Picture ? clip.pictures : clip.sounds)
-                .push_back({id, data, frames});
+            (isPicture ? clip.pictures : clip.sounds).push_back({id, data.id, frames});
         }
     }
     return clip;
@@ -185,10 +167,9 @@ private:
     // The same clips at the same rate have the same id, whenever and by whomever they are put
     // together.
     void SetId(const std::vector<Clip>& clips) {
-        std::vector<unsigned char> bytes;
+        std::string bytes;
         const auto add = [&](const auto& value) {
-            const auto* const first = reinterpret_cast<const unsigned char*>(&value);
-            bytes.insert(bytes.end(), first, first + sizeof value);
+            bytes.append(reinterpret_cast<const char*>(&value), sizeof value);
         };
         add(rate_.numerator);
         add(rate_.denominator);
@@ -196,20 +177,12 @@ private:
             add(clip.id);
             add(clip.Frames());
         }
-        void* digest = nullptr;
-        GUID material{};
+        const Digest digest = DigestOf(bytes);
         aafMobID_t id{};
-        NCFRESULT made = GenerateUMIDFromData_Begin(&digest);
-        if (made >= 0) {
-            made = GenerateUMIDFromData_AddData(&digest, static_cast<ncfUInt32>(bytes.size()),
-                                                bytes.data());
-            const NCFRESULT finished = GenerateUMIDFromData_Finish(&digest, &material);
-            made = made < 0 ? made : finished;
-        }
-        if (made >= 0 && mob_->GetMobID(&id) >= 0) {
-            id.material = material;
-            Check(mob_->SetMobID(id));
-        }
+        Check(mob_->GetMobID(&id));
+        static_assert(sizeof id.material == sizeof digest);
+        std::memcpy(&id.material, digest.data(), sizeof digest);
+        Check(mob_->SetMobID(id));
     }
 
     // A track of what it is in the first clip that has it.

@@ -39,20 +39,22 @@ std::string Named(const ClipPlace& place) {
 }
 
 void PrintClip(const CheckedClip& checked) {
-    const ClipPlace* const place = checked.Telling();
-    std::string line =
-        fmt::format("{}: {}: {}", host::text::PrintableLines(checked.clip.name),
-                    NameOf(checked.state), place ? Named(*place) : "it names no place");
-    if (!checked.found.empty()) {
-        line += " -> " + host::DisplayPath(checked.found.front());
-    } else if (checked.state == ClipState::Moved) {
-        const auto same =
-            std::find_if(checked.places.begin(), checked.places.end(),
-                         [](const ClipPlace& one) { return one.state == ClipState::Same; });
-        line += fmt::format("; it is at {}", Named(*same));
+    const auto same =
+        std::find_if(checked.places.begin(), checked.places.end(),
+                     [](const ClipPlace& one) { return one.state == ClipState::Same; });
+    const ClipPlace* const telling = checked.Telling();
+    std::string line = fmt::format("{}: {}: ", host::text::PrintableLines(checked.clip.name),
+                                   NameOf(checked.state));
+    if (checked.state == ClipState::Same && telling != &*same) {
+        line += Named(*same) + "; ";
     }
-    if (place && !place->reason.empty()) {
-        line += ": " + host::text::PrintableLines(place->reason);
+    line += telling ? Named(*telling) : "it names no place";
+    if (telling && !telling->reason.empty()) {
+        line += ": " + host::text::PrintableLines(telling->reason);
+    }
+    if (checked.state == ClipState::Moved) {
+        line += checked.found.empty() ? "; it is at " + Named(*same)
+                                      : " -> " + host::DisplayPath(checked.found.front());
     }
     fmt::print("{}\n", line);
 }

@@ -4,6 +4,7 @@
 
 #include <unistd.h>
 
+#include <atomic>
 #include <cerrno>
 #include <cstring>
 #include <ctime>
@@ -14,13 +15,21 @@ namespace host::system {
 namespace {
 
 volatile std::sig_atomic_t noted = 0;
-volatile std::time_t notedAt = 0;
+std::atomic<long long> notedAt = 0;
+static_assert(std::atomic<long long>::is_always_lock_free, "a handler may use it");
 const char* volatile lineToWrite = nullptr;
 int objects = 0;
 
+// In milliseconds; may be asked for in a handler.
+long long Now() {
+    timespec now{};
+    clock_gettime(CLOCK_MONOTONIC, &now);
+    return now.tv_sec * 1000LL + now.tv_nsec / 1'000'000;
+}
+
 // Some senders send a signal twice at once, to the program and to its group.
 bool IsSecond() {
-    return noted != 0 && std::time(nullptr) > notedAt + 1;
+    return noted != 0 && Now() >= notedAt + 1000;
 }
 
 extern "C" void NoteSignal(int signal) {
@@ -29,7 +38,7 @@ extern "C" void NoteSignal(int signal) {
     if (line != nullptr && IsSecond()) {
         EndBySignal(signal);
     } else if (noted == 0) {
-        notedAt = std::time(nullptr);
+        notedAt = Now();
         noted = signal;
         // Who closed a pipe has had enough.
         if (line != nullptr && signal != SIGPIPE &&

@@ -296,6 +296,18 @@ TEST_F(BinFile, MakesCopiesOneClipWithTwoPlacesAndTellsSo) {
     EXPECT_EQ(answer[1]["aaf"], (folder() / "bin.aaf").string());
 }
 
+TEST_F(BinFile, TellsNoCopyOfAMovieThatIsNamedTwice) {
+    Copy("a.mov");
+    const CommandResult run = RunCliphost("describe -q " + In("in/a.mov") + " " + In("in/a.mov") +
+                                          " --bin " + In("bin.aaf"));
+    EXPECT_EQ(run.status, 0);
+    EXPECT_EQ(run.out.find("has the content of"), std::string::npos) << run.out;
+    const Json tree = Dump("bin.aaf");
+    std::set<std::string> urls;
+    Collect(tree, "URLString", urls);
+    EXPECT_EQ(urls.size(), 1u);
+}
+
 TEST_F(BinFile, HoldsTheRestWhereAMovieFails) {
     Movie("a.mov", 1, 0, 10);
     std::ofstream(folder() / "in/b.mov") << "no movie at all";
@@ -350,8 +362,8 @@ TEST_F(BinFile, GoesToStandardOutput) {
 class Stringout : public BinFile {
 protected:
     // The tracks of the sequence of all movies in the folder `in`.
-    Json SequenceOf(const std::string& options = "") {
-        EXPECT_EQ(RunCliphost(options + " describe -q " + In("in") + " --stringout --bin " +
+    Json SequenceOf(const std::string& before = "") {
+        EXPECT_EQ(RunCliphost(before + " describe -q " + In("in") + " --stringout --bin " +
                               In("bin.aaf"))
                       .status,
                   0);

@@ -684,4 +684,17 @@ TEST_F(Stopped, WritesNoPartOfABin) {
     }
 }
 
+TEST_F(Inputs, AreNeverReplacedByAnOutputOfTheSameRun) {
+    Copy("in/clip.mov");
+    Copy("in/clip.png");
+    const movies::Bytes before = ReadFile(folder() / "in/clip.png");
+    for (const char* const jobs : {"1", "2"}) {
+        const CommandResult run =
+            RunCliphost("contact " + In("in") + " --extensions mov,png --jobs " + jobs +
+                        " --out-dir " + In("in"));
+        ExpectSays(run, 2, "clip.png: this is the movie itself");
+        EXPECT_TRUE(ReadFile(folder() / "in/clip.png") == before) << jobs;
+    }
+}
+
 }  // namespace

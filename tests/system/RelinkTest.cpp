@@ -241,8 +241,9 @@ TEST_F(VerifyVerb, TellsWhatBecameOfEachClip) {
         EXPECT_NE(run.out.find("\n5 clips: 1 same, 1 moved, 1 unknown, 1 missing, 1 changed\n"),
                   std::string::npos)
             << run.out;
-        EXPECT_NE(run.out.find("a: moved: " + (folder() / "in/a.mov").string() + " -> " +
-                               (folder() / "new/deep/renamed.MOV").string()),
+        EXPECT_NE(run.out.find("a: moved: " + (folder() / "in/a.mov").string() +
+                               ": there is no such file or folder -> " +
+                               (folder() / "new/deep/renamed.MOV").string() + "\n"),
                   std::string::npos)
             << run.out;
         texts.insert(run.out);
@@ -268,6 +269,29 @@ TEST_F(VerifyVerb, TakesAClipForTheSameWhereAllItsPlacesAre) {
                "; it is at " + (folder() / "in/b.mov").string());
     Remove("in/b.mov");
     EXPECT_EQ(StatesNow("", 1), (States{{"a", "missing"}}));
+}
+
+TEST_F(VerifyVerb, TakesNothingAgainstAClipFromAPlaceThatItCanNotCheck) {
+    Movie("in/a.mov", 10);
+    Describe();
+    AddPlace("bin.aaf", "more.aaf", "file://server/share/a.mov");
+    ExpectSays(RunCliphost("verify " + In("more.aaf")), 0,
+               "a: same: " + (folder() / "in/a.mov").string() +
+                   "; file://server/share/a.mov: this is a place of another machine");
+}
+
+TEST_F(VerifyVerb, TellsTheReasonBesideThePlaceThatItIsAbout) {
+    Movie("in/a.mov", 10);
+    Describe();
+    fs::copy_file(folder() / "in/a.mov", folder() / "b.mov");
+    AddPlace("bin.aaf", "more.aaf", UrlOf("gone.mov"));
+    const std::string gone =
+        "a: moved: " + (folder() / "gone.mov").string() + ": there is no such file or folder";
+    ExpectSays(RunCliphost("verify " + In("more.aaf")), 1,
+               gone + "; it is at " + (folder() / "in/a.mov").string() + "\n");
+    fs::remove(folder() / "in/a.mov");
+    ExpectSays(RunCliphost("verify " + In("more.aaf") + " --search " + In("")), 1,
+               " -> " + (folder() / "b.mov").string() + "\n");
 }
 
 TEST_F(VerifyVerb, TellsWhichFactsAreOthers) {
@@ -480,6 +504,35 @@ TEST_F(RelinkVerb, TakesTheFirstOfSeveralCopiesAndTellsTheRest) {
                "a -> " + (folder() / "new/1/z.mov").string() + "; the same content is in " +
                    (folder() / "new/2/a.mov").string() + "\n");
     EXPECT_EQ(UrlsOf("out.aaf"), Twice({UrlOf("new/1/z.mov")}));
+}
+
+TEST_F(RelinkVerb, FindsTheCopyThatMovedWhereAnotherStays) {
+    Movie("in/a.mov", 10);
+    fs::copy_file(folder() / "in/a.mov", folder() / "in/b.mov");
+    Describe();
+    Move("in/a.mov", "new/c.mov");
+    const CommandResult run = RunCliphost(Call());
+    ExpectSays(run, 0, "a -> " + (folder() / "new/c.mov").string());
+    EXPECT_EQ(run.out.find("removed"), std::string::npos) << run.out;
+    const Texts urls = UrlsOf("out.aaf");
+    for (const char* const name : {"new/c.mov", "in/b.mov"}) {
+        EXPECT_EQ(std::count(urls.begin(), urls.end(), '"' + UrlOf(name) + '"'), 2) << name;
+    }
+    EXPECT_EQ(urls.size(), 4u);
+}
+
+TEST_F(RelinkVerb, IsNeverWrittenOntoWhatIsNoAafFile) {
+    Movie("in/a.mov", 10);
+    Describe();
+    Movie("new/z.mov", 30);
+    Write(movies::Bytes{'n', 'o'}, "new/notes.txt");
+    for (const char* const file : {"new/z.mov", "new/notes.txt"}) {
+        const movies::Bytes before = ReadFile(folder() / file);
+        ExpectSays(RunCliphost(Call("", file)), 2, "there is a file that is no AAF file");
+        EXPECT_TRUE(ReadFile(folder() / file) == before) << file;
+    }
+    Write(movies::Bytes{}, "empty.aaf");
+    EXPECT_EQ(RunCliphost(Call("", "empty.aaf")).status, 0) << "as mktemp leaves it";
 }
 
 TEST_F(RelinkVerb, RemovesPlacesThatLeadNowhere) {

@@ -20,6 +20,7 @@ protected:
     HelpWords() {
         app_.footer("Exit status: 0.");
         app_.add_flag("-v", "Say more; -vv says all");
+        app_.add_option("--module", module_, "Another module");
         CLI::App* const show = app_.add_subcommand("show", "Show what's there");
         show->footer("Example: cliphost show a\\b\n.hidden");
         show->add_option("files", files_, "Files")->required();
@@ -53,6 +54,7 @@ protected:
 private:
     std::vector<std::string> files_;
     std::string output_;
+    std::string module_;
     CLI::App app_{"Does things", "cliphost"};
 };
 
@@ -91,6 +93,7 @@ TEST_F(HelpWords, GiveAManualPage) {
     EXPECT_TRUE(Holds(page, ".B cliphost show\n[\\fIoptions\\fR] \\fIfiles\\fR ...\n")) << page;
     EXPECT_TRUE(Holds(page, "\\fB\\-o, \\-\\-output\\fR \\fIvalue\\fR\n")) << page;
     EXPECT_TRUE(Holds(page, ".SH OUTPUT: PLACES\n"));
+    EXPECT_TRUE(Holds(page, ".SH SEE ALSO\n.BR cliphost (1)\n"));
     EXPECT_TRUE(Holds(page, "a\\eb\n\\&.hidden\n")) << "no line is a request: " << page;
 }
 
@@ -108,6 +111,8 @@ TEST_F(HelpWords, CompleteVerbsAndOptionsInBash) {
     EXPECT_EQ(BashOffers("cliphost list --a"), "");
     EXPECT_EQ(BashOffers("cliphost show -v"), "-v") << "the program's own, too";
     EXPECT_EQ(BashOffers("cliphost show x"), "") << "files are the shell's affair";
+    EXPECT_EQ(BashOffers("cliphost --module show l"), "list") << "that is a file's name";
+    EXPECT_EQ(BashOffers("cliphost --module show list --a"), "");
 }
 
 TEST_F(HelpWords, AreQuotedForZshAndFish) {

@@ -50,6 +50,14 @@ TEST(InputList, TakesListsOfOtherSystems) {
                      "b"}));
 }
 
+// Lists are read in pieces, and a mark of UTF-16 is one at the very start alone.
+TEST(InputList, TakesNamesThatBeginAsAMarkWouldWhereverAPieceBegins) {
+    for (std::size_t size = 512; size <= std::size_t{1} << 20; size *= 2) {
+        const std::string first(size - 1, 'a');
+        EXPECT_EQ(PathsOf(first + "\n\xFF\xFE.mov"), (Paths{first, "\xFF\xFE.mov"})) << size;
+    }
+}
+
 TEST(InputList, LeavesNamesBetweenZerosAsTheyAre) {
     const auto nulls = [](std::string text) {
         std::replace(text.begin(), text.end(), '|', '\0');

@@ -64,6 +64,17 @@ TEST(PathMaps, TakeAFolderFromTheWorkingFolder) {
     EXPECT_EQ(ToOther(".=/x", "file://" + here + "/c.mov"), "file:///x/c.mov");
 }
 
+TEST(PathMaps, TakeFoldersHoweverTheyAreWritten) {
+    const std::string url = "file:///mnt/media/c.mov";
+    for (const char* const from :
+         {"/mnt/media/.", "/mnt/x/../media", "/mnt//media", "/mnt/media///"}) {
+        EXPECT_EQ(ToOther(std::string(from) + "=/x", url), "file:///x/c.mov") << from;
+    }
+    EXPECT_EQ(ToOther("/mnt/media=//server/a/../b", url), "file://server/b/c.mov");
+    EXPECT_EQ(ToOther("/mnt/media=M:/a/./b", url), "file:///M:/a/b/c.mov");
+    EXPECT_EQ(ToThis("/here=/x", "file:///y/../x/c.mov"), "file:///here/c.mov");
+}
+
 TEST(PathMaps, LeaveWhatDoesNotLieInTheFolder) {
     EXPECT_EQ(ToOther("/mnt/media=/x", "file:///mnt/media2/c.mov"), "not file:///mnt/media2/c.mov");
     EXPECT_EQ(ToOther("/mnt/media=/x", "file:///mnt/Media/c.mov"), "not file:///mnt/Media/c.mov");

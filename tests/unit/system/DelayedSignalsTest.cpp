@@ -92,7 +92,7 @@ TEST(DelayedSignals, EndTheProgramAtTheSecondWhereWorkMayTakeLong) {
                   folder.Write(file.path().filename(), "half");
                   std::raise(SIGINT);
                   std::raise(SIGINT);  // the same, sent twice
-                  std::this_thread::sleep_for(std::chrono::milliseconds(2200));
+                  std::this_thread::sleep_for(std::chrono::milliseconds(1200));
                   std::raise(SIGTERM);
                   _exit(7);
               }),
