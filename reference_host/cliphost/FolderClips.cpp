@@ -13,6 +13,7 @@
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/Paths.h"
@@ -22,10 +23,9 @@ namespace {
 
 // The one ending that the module looks for in a folder.
 constexpr std::string_view kClaimedEnding = ".mov";
-// Endings of movies, in small letters.
-constexpr std::string_view kMovieEndings[] = {".mov",  ".mp4",   ".m4v", ".mpg", ".mpe",
-                                              ".mpeg", ".m2t",   ".3gp", ".3g2", ".qt",
-                                              ".moov", ".movie", ".avi", ".dv"};
+// Endings of movies, as lists of endings have them.
+const std::vector<std::string> kMovieEndings = {"mov", "mp4", "m4v", "mpg",  "mpe",   "mpeg", "m2t",
+                                                "3gp", "3g2", "qt",  "moov", "movie", "avi",  "dv"};
 constexpr std::size_t kMostNames = 3;  // shown of those left out
 
 void Check(NCFRESULT result, const char* what) {
@@ -39,12 +39,6 @@ host::Ref<NMA::IMediaVolume> Volume(Session& session) {
     Check(session.host().Create(NMA::CompID_QuickTimeMediaVolume, volume),
           "the module makes no media volume");
     return volume;
-}
-
-bool HasMovieEnding(const std::filesystem::path& name) {
-    const std::string ending = InSmallLetters(name.extension().native());
-    return std::find(std::begin(kMovieEndings), std::end(kMovieEndings), ending) !=
-           std::end(kMovieEndings);
 }
 
 // A name for the movie that the module claims and that is not taken.
@@ -84,37 +78,16 @@ std::string HowToName(const std::vector<std::filesystem::path>& movies) {
 }  // namespace
 
 OtherMovies FindOtherMovies(const std::filesystem::path& folder) {
-    if (Problem problem = WhyUnlistable(folder)) {
-        throw Failure(kExitCaller, std::move(problem));
-    }
     OtherMovies others;
-    std::error_code error;
-    std::filesystem::directory_iterator entry(folder, error);
-    for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error)) {
-        const std::filesystem::path name = entry->path().filename();
-        std::error_code ignored;
-        if (!HasMovieEnding(name) || entry->is_directory(ignored)) {
-            continue;
+    others.noFiles = ForEachByEnding(folder, kMovieEndings, [&](const std::filesystem::path& file) {
+        if (file.extension() != kClaimedEnding) {
+            others.otherEnding.push_back(file);
+        } else if (host::system::HoldsBackslash(file.filename())) {
+            others.withBackslash.push_back(file);
         }
-        if (!entry->is_regular_file(ignored)) {
-            if (Problem problem = WhyUnreadable(entry->path())) {
-                others.noFiles.push_back(std::move(problem));
-            }
-            continue;
-        }
-        if (name.extension() != kClaimedEnding) {
-            others.otherEnding.push_back(entry->path());
-        } else if (host::system::HoldsBackslash(name)) {
-            others.withBackslash.push_back(entry->path());
-        }
-    }
-    if (error) {
-        throw Failure(kExitCaller, folder, "the folder can't be listed: " + error.message());
-    }
+    });
     std::sort(others.otherEnding.begin(), others.otherEnding.end());
     std::sort(others.withBackslash.begin(), others.withBackslash.end());
-    std::sort(others.noFiles.begin(), others.noFiles.end(),
-              [](const Problem& a, const Problem& b) { return a.subject < b.subject; });
     return others;
 }
 

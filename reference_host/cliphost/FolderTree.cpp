@@ -94,12 +94,13 @@ std::vector<std::string> EndingsIn(const std::string& list) {
     return endings;
 }
 
-EndingMatches FilesByEnding(const std::filesystem::path& folder,
-                            const std::vector<std::string>& endings) {
+std::vector<Problem> ForEachByEnding(
+    const std::filesystem::path& folder, const std::vector<std::string>& endings,
+    const std::function<void(const std::filesystem::path&)>& take) {
     if (Problem problem = WhyUnlistable(folder)) {
         throw Failure(kExitCaller, std::move(problem));
     }
-    EndingMatches matches;
+    std::vector<Problem> noFiles;
     std::error_code error;
     std::filesystem::directory_iterator entry(folder, error);
     for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error)) {
@@ -109,17 +110,25 @@ EndingMatches FilesByEnding(const std::filesystem::path& folder,
             continue;
         }
         if (entry->is_regular_file(ignored)) {
-            matches.files.push_back(entry->path());
+            take(entry->path());
         } else if (Problem problem = WhyUnreadable(entry->path())) {
-            matches.noFiles.push_back(std::move(problem));
+            noFiles.push_back(std::move(problem));
         }
     }
     if (error) {
         throw Failure(kExitCaller, folder, "the folder can't be listed: " + error.message());
     }
-    std::sort(matches.files.begin(), matches.files.end());
-    std::sort(matches.noFiles.begin(), matches.noFiles.end(),
+    std::sort(noFiles.begin(), noFiles.end(),
               [](const Problem& a, const Problem& b) { return a.subject < b.subject; });
+    return noFiles;
+}
+
+EndingMatches FilesByEnding(const std::filesystem::path& folder,
+                            const std::vector<std::string>& endings) {
+    EndingMatches matches;
+    matches.noFiles = ForEachByEnding(
+        folder, endings, [&](const std::filesystem::path& file) { matches.files.push_back(file); });
+    std::sort(matches.files.begin(), matches.files.end());
     return matches;
 }
 

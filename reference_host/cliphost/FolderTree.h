@@ -3,6 +3,7 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -18,12 +19,18 @@ std::vector<std::filesystem::path> FoldersIn(const std::filesystem::path& folder
 // them do not count. Throws a Failure that says what is wrong.
 std::vector<std::string> EndingsIn(const std::string& list);
 
+// Calls for each file of a folder whose name ends so, in no order. Gives what is no file, such as
+// links that end nowhere and pipes, in the order of names. Throws a Failure for a folder that
+// can't be read.
+std::vector<Problem> ForEachByEnding(const std::filesystem::path& folder,
+                                     const std::vector<std::string>& endings,
+                                     const std::function<void(const std::filesystem::path&)>& take);
+
 // Files of a folder by the endings of their names, in the order of names.
 struct EndingMatches {
     std::vector<std::filesystem::path> files;
-    std::vector<Problem> noFiles;  // links that end nowhere, pipes and the like
+    std::vector<Problem> noFiles;
 };
-// Throws a Failure for a folder that can't be read.
 EndingMatches FilesByEnding(const std::filesystem::path& folder,
                             const std::vector<std::string>& endings);
 

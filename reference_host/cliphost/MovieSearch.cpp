@@ -6,6 +6,7 @@
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
@@ -19,40 +20,28 @@ public:
     explicit FolderSearch(const std::set<std::string>& endings) : endings_(endings) {}
 
     void Search(const std::filesystem::path& top) {
-        std::vector<std::filesystem::path> open = {top};
-        while (!open.empty()) {
-            const std::filesystem::path folder = std::move(open.back());
-            open.pop_back();
-            std::vector<std::filesystem::path> inside = List(folder);
-            // Those that are found later are searched first.
-            open.insert(open.end(), inside.rbegin(), inside.rend());
+        for (const std::filesystem::path& folder : FoldersIn(top)) {
+            List(folder);
         }
     }
 
     std::vector<std::filesystem::path> Take() { return std::move(files_); }
 
 private:
-    // Takes the files; gives the folders.
-    std::vector<std::filesystem::path> List(const std::filesystem::path& folder) {
-        std::vector<std::filesystem::path> folders;
+    void List(const std::filesystem::path& folder) {
         std::vector<std::filesystem::path> files;
         std::error_code error;
         std::filesystem::directory_iterator entry(folder, error);
         for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error)) {
             std::error_code ignored;
-            if (entry->is_directory(ignored)) {
-                if (!entry->is_symlink(ignored)) {
-                    folders.push_back(entry->path());
-                }
-            } else if (endings_.count(SoughtEnding(entry->path())) != 0 &&
-                       entry->is_regular_file(ignored)) {
+            if (endings_.count(SoughtEnding(entry->path())) != 0 &&
+                entry->is_regular_file(ignored)) {
                 files.push_back(entry->path());
             }
         }
         if (error) {
             Notice("cliphost: {}: not searched: {}\n", host::DisplayPath(folder), error.message());
         }
-        std::sort(folders.begin(), folders.end());
         std::sort(files.begin(), files.end());
         for (std::filesystem::path& file : files) {
             const auto number = host::system::NumberOf(file);
@@ -60,7 +49,6 @@ private:
                 files_.push_back(std::move(file));
             }
         }
-        return folders;
     }
 
     const std::set<std::string>& endings_;

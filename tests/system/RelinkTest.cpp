@@ -415,6 +415,16 @@ TEST_F(RelinkVerb, FindsAFolderThatWasMoved) {
     EXPECT_EQ(UrlsOf("out.aaf"), Twice({UrlOf("new/place/a.mov"), UrlOf("new/place/b.mov")}));
 }
 
+TEST_F(RelinkVerb, SearchesFoldersBehindLinksOnce) {
+    Movie("in/a.mov", 10);
+    Describe();
+    Move("in/a.mov", "elsewhere/a.mov");
+    fs::create_directories(folder() / "new");
+    fs::create_directory_symlink(folder() / "elsewhere", folder() / "new/link");
+    fs::create_directory_symlink(folder() / "new", folder() / "elsewhere/round");
+    ExpectSays(RunCliphost(Call()), 0, "a -> " + (folder() / "new/link/a.mov").string() + "\n");
+}
+
 TEST_F(RelinkVerb, LeavesAllElseAsItIs) {
     Movie("in/a.mov", 10);
     Movie("new/other.mov", 20);
