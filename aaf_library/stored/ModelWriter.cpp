@@ -198,11 +198,7 @@ private:
         const auto& kept = static_cast<const KeptProperty&>(*value.asStored());
         TakeAlong(value);
         for (const auto& [set, id] : kept.targets) {
-            if (model_.dictionary().FindDefinition(set, id) != nullptr) {
-                const StoredAuid key = AuidOf(id);
-                targets_[{meta::kRootHeader, prop::Header_Dictionary.pid, set}].insert(
-                    Bytes(key.begin(), key.end()));
-            }
+            keptTargets_.emplace(set, AuidOf(id));
         }
         StoredProperty out = kept.property;
         out.pid = definition.pid();
@@ -467,8 +463,15 @@ private:
         return out;
     }
 
-    // A built-in definition may be referred to before anybody has looked it up.
+    // A built-in definition may be referred to before anybody has looked it up. It joins the sets
+    // of the dictionary, so this is no work for the middle of a walk through them.
     void MakeTargets(const Dictionary& dictionary) {
+        for (const auto& [set, key] : keptTargets_) {
+            if (dictionary.FindDefinition(set, GuidOf(key)) != nullptr) {
+                targets_[{meta::kRootHeader, prop::Header_Dictionary.pid, set}].insert(
+                    Bytes(key.begin(), key.end()));
+            }
+        }
         for (const auto& [path, keys] : targets_) {
             if (IsWithinDictionary(path)) {
                 for (const Bytes& key : keys) {
@@ -546,6 +549,8 @@ private:
     const Object* replaced_ = nullptr;
     const Object* content_ = nullptr;
     std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
+    // The same for what is written as it stands. These may lead to nothing.
+    std::set<std::pair<PropertyId, StoredAuid>> keptTargets_;
     std::unordered_map<const ClassDefinition*, ClassFacts> classes_;
 };
 

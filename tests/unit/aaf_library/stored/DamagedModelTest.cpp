@@ -9,6 +9,7 @@
 #include "aaf_library/stored/TreeReader.h"
 #include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
@@ -62,6 +63,17 @@ StoredObject& FirstSlot(StoredObject& tree) {
 
 StoredProperty& types(StoredObject& tree) {
     return property(property(tree, 1).objects.front(), meta::kTypeDefinitions);
+}
+
+StoredObject& dictionary(StoredObject& tree) {
+    return property(header(tree), prop::Header_Dictionary.pid).objects.front();
+}
+
+void Erase(StoredObject& object, std::uint16_t pid) {
+    auto& all = object.properties;
+    all.erase(std::remove_if(all.begin(), all.end(),
+                             [pid](const StoredProperty& entry) { return entry.pid == pid; }),
+              all.end());
 }
 
 using Notes = std::vector<std::string>;
@@ -415,6 +427,48 @@ TEST(DamagedModel, AnArrayTypeLargerThanAnyValueIsLeftOut) {
     const sample::SampleModel model = read(tree);
     EXPECT_EQ(model.model->FindType(type.id), nullptr);
     EXPECT_EQ(model.notes, Notes{"the type Huge makes no sense and is left out"});
+}
+
+// Odd references within definitions name built-in ones that nobody has looked up: those join the
+// sets that are being written.
+TEST(DamagedModel, WhatADefinitionRefersToIsMadeWhenItIsWritten) {
+    StoredObject tree = SampleTree();
+    StoredProperty odd;
+    odd.pid = prop::DefinitionObject_Description.pid;
+    odd.form = StoredForm::WeakReference;
+    odd.targetPath = {meta::kRootHeader, prop::Header_Dictionary.pid,
+                      prop::Dictionary_DataDefinitions.pid};
+    odd.keyPid = prop::DefinitionObject_Identification.pid;
+    const StoredAuid edgecode = AuidOf(kAAFDataDef_Edgecode);
+    odd.keys = {Bytes(edgecode.begin(), edgecode.end())};
+    StoredProperty& containers =
+        property(dictionary(tree), prop::Dictionary_ContainerDefinitions.pid);
+    StoredObject& own = containers.objects.at(IndexOf(containers, sample::kOwnDefinitionId));
+    Erase(own, odd.pid);
+    own.properties.push_back(odd);
+    Erase(dictionary(tree), prop::Dictionary_DataDefinitions.pid);
+    StoredProperty& set = mobs(tree);
+    set.objects.clear();
+    set.keys.clear();
+    set.localKeys.clear();
+
+    const sample::SampleModel sample = read(tree);
+    // As many sets as one more makes move.
+    for (const GUID& classId : {AUID_AAFInterpolationDefinition, AUID_AAFKLVDataDefinition,
+                                AUID_AAFTaggedValueDefinition}) {
+        const RefPtr<Object> more = sample.model->CreateObject(*sample.model->FindClass(classId));
+        ASSERT_GE(more->PutStruct(prop::DefinitionObject_Identification, sample::kOwnClassId), 0);
+        ASSERT_GE(more->PutString(prop::DefinitionObject_Name, L"More"), 0);
+        ASSERT_GE(sample.model->dictionary().AddDefinition(classId, more.get()), 0);
+    }
+    ASSERT_EQ(sample.model->dictionary().MadeValues().size(), 4u);
+    StoredObject saved =
+        ReadTree(WriteTree(TreeOfModel(*sample.model, *sample.header), SectorSize::Bytes512));
+    StoredProperty& again = property(dictionary(saved), prop::Dictionary_ContainerDefinitions.pid);
+    StoredObject& ownAgain = again.objects.at(IndexOf(again, sample::kOwnDefinitionId));
+    EXPECT_EQ(property(ownAgain, odd.pid).keys, odd.keys);
+    // Each set that is there, and the one that came in between.
+    EXPECT_EQ(sample.model->dictionary().MadeValues().size(), 5u);
 }
 
 // Every number, key, name and value of the tree changed in turn.
