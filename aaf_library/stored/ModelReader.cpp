@@ -265,9 +265,9 @@ private:
         for (const StoredProperty& property : from.properties) {
             const PropertyDefinition* definition =
                 definitions_.property(dictionary.classDefinition(), property.pid);
-            const bool isSet = definition != nullptr && definition->type() != nullptr &&
-                               property.problem.empty() && property.form == StoredForm::StrongSet &&
-                               StoredFormOf(*definition->type()) == StoredForm::StrongSet;
+            const bool isSet = definition != nullptr &&
+                               Dictionary::IsSetOfDefinitions(definition->pid()) &&
+                               property.problem.empty() && property.form == StoredForm::StrongSet;
             if (isSet) {
                 EnterSet(dictionary, *definition, property, entered);
             } else {

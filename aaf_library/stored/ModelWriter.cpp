@@ -490,7 +490,8 @@ private:
         const Path path = {meta::kRootHeader, prop::Header_Dictionary.pid, set.pid};
         for (const RefPtr<Object>& definition : definitions) {
             const Bytes key = definition->UniqueKey();
-            const bool wanted = !IsBuiltInContainer(key) || targets_[path].count(key) != 0;
+            const bool wanted = set.pid != prop::Dictionary_ContainerDefinitions.pid ||
+                                !IsBuiltInContainer(key) || targets_[path].count(key) != 0;
             if (wanted && stored.insert(definition.get()).second) {
                 set.keys.push_back(key);
                 set.objects.push_back(StoredObjectOf(*definition));

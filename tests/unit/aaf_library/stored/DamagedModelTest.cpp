@@ -471,6 +471,28 @@ TEST(DamagedModel, WhatADefinitionRefersToIsMadeWhenItIsWritten) {
     EXPECT_EQ(sample.model->dictionary().MadeValues().size(), 5u);
 }
 
+// A set of definitions that a file adds to those of the dictionary.
+TEST(DamagedModel, ASetOfItsOwnInTheDictionaryKeepsItsElements) {
+    const sample::SampleModel made = sample::WholeModel();
+    constexpr GUID ownSet = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E92");
+    const PropertyDefinition& more =
+        made.model->FindClass(AUID_AAFDictionary)
+            ->AddProperty(ownSet, L"MoreContainers",
+                          kAAFTypeID_ContainerDefinitionStrongReferenceSet, true, false);
+    // The second has the id of one that is built in elsewhere.
+    for (const GUID& id : {sample::kOwnClassId, BuiltInContainerDefinitions().begin()->id}) {
+        const RefPtr<Object> element =
+            made.model->CreateObject(*made.model->FindClass(AUID_AAFContainerDefinition));
+        ASSERT_GE(element->PutStruct(prop::DefinitionObject_Identification, id), 0);
+        ASSERT_GE(element->PutString(prop::DefinitionObject_Name, L"More"), 0);
+        ASSERT_GE(made.model->dictionary().AddToSet(more.key(), element->Identity()), 0);
+    }
+    StoredObject tree = TreeOfModel(*made.model, *made.header);
+    ASSERT_EQ(property(dictionary(tree), more.pid()).objects.size(), 2u);
+    EXPECT_EQ(read(tree).notes, Notes());
+    EXPECT_EQ(passed(tree), ReadTree(WriteTree(tree, SectorSize::Bytes512)));
+}
+
 // Every number, key, name and value of the tree changed in turn.
 TEST(DamagedModel, WithARandomChangeIsReadOrRefusedButNeverHarms) {
     const unsigned seed = std::random_device()();
