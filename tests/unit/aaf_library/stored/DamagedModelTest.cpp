@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/stored/MetaKinds.h"
 #include "aaf_library/stored/MetaPids.h"
 #include "aaf_library/stored/MetaRecords.h"
 #include "aaf_library/stored/ModelReader.h"
@@ -469,6 +470,36 @@ TEST(DamagedModel, WhatADefinitionRefersToIsMadeWhenItIsWritten) {
     EXPECT_EQ(property(ownAgain, odd.pid).keys, odd.keys);
     // Each set that is there, and the one that came in between.
     EXPECT_EQ(sample.model->dictionary().MadeValues().size(), 5u);
+}
+
+// A record is as long as its members are now.
+TEST(DamagedModel, ARecordFollowsTheWidthOfItsMembers) {
+    const sample::SampleModel made = sample::WholeModel();
+    const aafProductVersion_t version{1, 2, 3, 4, kAAFVersionReleased};
+    const auto identification = [](const sample::SampleModel& sample) -> Object& {
+        return *sample.header->ObjectAt(prop::Header_IdentificationList, 0);
+    };
+    ASSERT_GE(identification(made).PutStruct(prop::Identification_ProductVersion, version), 0);
+    StoredObject tree = TreeOfModel(*made.model, *made.header);
+    StoredObject& release =
+        types(tree).objects.at(IndexOf(types(tree), kAAFTypeID_ProductReleaseType));
+    const StoredAuid wide = AuidOf(kAAFTypeID_UInt64);
+    property(release, TargetPidOf(TypeKind::Enumeration)).keys.at(0) =
+        Bytes(wide.begin(), wide.end());
+
+    const sample::SampleModel sample = read(tree);
+    EXPECT_EQ(sample.notes, Notes{"IdentificationList: ProductVersion: 9 bytes are no value of its "
+                                  "type; it is kept as it stands"});
+    EXPECT_EQ(sample.model->FindType(kAAFTypeID_ProductVersion)->StoredSize(), 16u);
+    aafProductVersion_t got{};
+    EXPECT_EQ(identification(sample).ReadStruct(prop::Identification_ProductVersion, &got),
+              AAFRESULT_PROP_NOT_PRESENT);
+    ASSERT_GE(identification(sample).PutStruct(prop::Identification_ProductVersion, version), 0);
+    const sample::SampleModel again = read(TreeOfModel(*sample.model, *sample.header));
+    EXPECT_EQ(again.notes, Notes());
+    ASSERT_GE(identification(again).ReadStruct(prop::Identification_ProductVersion, &got), 0);
+    EXPECT_EQ(got.type, kAAFVersionReleased);
+    EXPECT_EQ(got.patchLevel, 4);
 }
 
 // A set of definitions that a file adds to those of the dictionary.
