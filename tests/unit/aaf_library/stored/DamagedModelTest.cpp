@@ -472,6 +472,48 @@ TEST(DamagedModel, WhatADefinitionRefersToIsMadeWhenItIsWritten) {
     EXPECT_EQ(sample.model->dictionary().MadeValues().size(), 5u);
 }
 
+TEST(DamagedModel, AVectorOfDefinitionsIsReadAsASet) {
+    StoredObject tree = SampleTree();
+    const StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+    for (const PropertyKey& key :
+         {prop::Dictionary_DataDefinitions, prop::Dictionary_ContainerDefinitions}) {
+        StoredProperty& set = property(dictionary(tree), key.pid);
+        set.form = StoredForm::StrongVector;
+        set.keys.clear();
+        set.localKeys.clear();
+    }
+    EXPECT_EQ(read(tree).notes, Notes());
+    EXPECT_EQ(passed(tree), before);
+    StoredProperty& containers =
+        property(dictionary(tree), prop::Dictionary_ContainerDefinitions.pid);
+    containers.objects.push_back(containers.objects.front());
+    Erase(containers.objects.back(), prop::DefinitionObject_Identification.pid);
+    EXPECT_EQ(read(tree).notes,
+              Notes{"ContainerDefinitions: a definition without a key; it is left out"});
+    EXPECT_EQ(passed(tree), before);
+}
+
+// Built-in ones come into being in their place, so nothing else can be kept there.
+TEST(DamagedModel, DefinitionsInAnotherFormAreLeftOutAndThatIsTold) {
+    StoredObject tree = SampleTree();
+    StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+    StoredProperty odd;
+    odd.pid = prop::Dictionary_DataDefinitions.pid;
+    odd.bytes = {1, 2, 3};
+    property(dictionary(tree), odd.pid) = odd;
+    EXPECT_EQ(read(tree).notes, Notes{"DataDefinitions: is stored in another form than its type "
+                                      "has; it is left out"});
+    EXPECT_EQ(passed(tree), before);
+    // No operation is built in.
+    odd.pid = prop::Dictionary_OperationDefinitions.pid;
+    dictionary(tree) = dictionary(before);
+    dictionary(tree).properties.push_back(odd);
+    EXPECT_EQ(read(tree).notes, Notes{"OperationDefinitions: is stored in another form than its "
+                                      "type has; it is kept as it stands"});
+    StoredObject again = passed(tree);
+    EXPECT_EQ(property(dictionary(again), odd.pid).bytes, odd.bytes);
+}
+
 // A record is as long as its members are now.
 TEST(DamagedModel, ARecordFollowsTheWidthOfItsMembers) {
     const sample::SampleModel made = sample::WholeModel();
