@@ -207,13 +207,33 @@ private:
         } else if (!out.bytes.empty()) {
             out.bytes = value.bytes();
         }
+        LeadNowhere(out);
         ForEachObject(out, [&](StoredObject& object) {
+            for (StoredProperty& inner : object.properties) {
+                LeadNowhere(inner);
+            }
             if (const GUID id = GuidOf(object.classId); model_.FindClass(id) != nullptr) {
                 closure_.AddClass(id);
             }
             Renumber(object, kept.numbers);
         });
         return out;
+    }
+
+    // A reference that made no sense still has the tag of a set, and the next file may have a set
+    // of that tag. It gets one that none has.
+    static void LeadNowhere(StoredProperty& reference) {
+        if (reference.problem.empty() || !IsWeak(reference.form)) {
+            return;
+        }
+        // In an index the tag stands behind the count.
+        const bool isIndex = reference.form != StoredForm::WeakReference && !reference.name.empty();
+        const std::size_t tag = isIndex ? sizeof(std::uint32_t) : 0;
+        Bytes& bytes = reference.bytes;
+        if (bytes.size() >= tag + sizeof(std::uint16_t)) {
+            std::fill_n(bytes.begin() + static_cast<std::ptrdiff_t>(tag), sizeof(std::uint16_t),
+                        std::uint8_t{0xFF});
+        }
     }
 
     void Renumber(StoredObject& object, const std::unordered_map<std::uint16_t, GUID>& numbers) {

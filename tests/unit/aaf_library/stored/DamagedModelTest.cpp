@@ -514,6 +514,33 @@ TEST(DamagedModel, DefinitionsInAnotherFormAreLeftOutAndThatIsTold) {
     EXPECT_EQ(property(dictionary(again), odd.pid).bytes, odd.bytes);
 }
 
+// A tag that the file does not have may be one of the next file's.
+TEST(DamagedModel, AReferenceWithAnUnknownTagNeverLeadsSomewhere) {
+    for (const bool isVector : {false, true}) {
+        StoredObject tree = SampleTree();
+        StoredObject& segment = property(FirstSlot(tree), prop::MobSlot_Segment.pid).objects[0];
+        StoredProperty& reference = property(segment, prop::Component_DataDefinition.pid);
+        const Bytes key = reference.keys.front();
+        reference.keys.clear();
+        reference.targetPath.clear();
+        reference.bytes = {1, 0, 0x01, 0x1B, 16};
+        reference.bytes.insert(reference.bytes.end(), key.begin(), key.end());
+        if (isVector) {
+            reference.form = StoredForm::WeakVector;
+            reference.name = u"DataDefinition";
+            reference.bytes.insert(reference.bytes.begin(), {1, 0, 0, 0});
+        }
+        reference.problem = "a weak reference has tag 1, the file has 0 paths";
+        const sample::SampleModel sample = read(tree);
+        ASSERT_EQ(sample.notes.size(), 1u);
+        const sample::SampleModel again = read(
+            ReadTree(WriteTree(TreeOfModel(*sample.model, *sample.header), SectorSize::Bytes512)));
+        ASSERT_EQ(again.notes.size(), 1u);
+        EXPECT_NE(again.notes[0].find("a weak reference has tag 65535"), std::string::npos)
+            << again.notes[0];
+    }
+}
+
 // A record is as long as its members are now.
 TEST(DamagedModel, ARecordFollowsTheWidthOfItsMembers) {
     const sample::SampleModel made = sample::WholeModel();
