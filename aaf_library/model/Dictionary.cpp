@@ -89,6 +89,10 @@ Object* Dictionary::FindDefinition(PropertyId set, const GUID& id) const {
     return key == nullptr ? nullptr : Find(*key, id);
 }
 
+bool Dictionary::IsSetOfDefinitions(PropertyId set) {
+    return SetWithNumber(set) != nullptr;
+}
+
 Object* Dictionary::FindMade(const PropertyKey& set, const GUID& id) const {
     Bytes key;
     key.reserve(kGuidSize);

@@ -16,6 +16,8 @@ public:
     Object* FindDefinition(const GUID& classId, const GUID& id) const;
     // The same by the property that holds the set.
     Object* FindDefinition(PropertyId set, const GUID& id) const;
+    // Whether a property holds a set that definitions are found in. A file may add other sets.
+    static bool IsSetOfDefinitions(PropertyId set);
     // Adds one of that class; its id must be new.
     HRESULT AddDefinition(const GUID& classId, Object* definition);
     HRESULT AddDefinition(PropertyId set, Object* definition);

@@ -214,13 +214,17 @@ RefPtr<TypeDefinition> MakeType(Model& model, const TypeFacts& facts) {
 
 namespace {
 
-// Whether a type is a rename of the other, however many stand between.
-bool LeadsTo(const TypeDefinition& type, const TypeDefinition& other) {
-    const TypeDefinition* at = &type;
-    while (at != &other && at->kind() == TypeKind::Rename && at->element() != nullptr) {
-        at = at->element();
+// Whether a type is the other, or made of it at any depth.
+bool IsMadeOf(const TypeDefinition& type, const TypeDefinition& other) {
+    if (&type == &other || (type.element() != nullptr && IsMadeOf(*type.element(), other))) {
+        return true;
     }
-    return at == &other;
+    if (type.kind() != TypeKind::Record) {
+        return false;
+    }
+    const std::vector<TypeDefinition*>& members = static_cast<const TypeRecord&>(type).types();
+    return std::any_of(members.begin(), members.end(),
+                       [&](const TypeDefinition* member) { return IsMadeOf(*member, other); });
 }
 
 // What a file lists, and behind it what we know besides.
@@ -266,7 +270,7 @@ bool Redefine(TypeDefinition& type, Model& model, const TypeFacts& facts) {
                 Joined(facts.members, MembersOf(type)));
             return true;
         case TypeKind::Rename:
-            if (sameKind && !LeadsTo(*target, type)) {
+            if (sameKind && !IsMadeOf(*target, type)) {
                 static_cast<TypeRename&>(type).Redefine(*target);
             }
             return true;

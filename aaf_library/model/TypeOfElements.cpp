@@ -84,6 +84,9 @@ HRESULT TypeOfElements::Decode(const std::uint8_t* stored, std::size_t size, voi
         std::memcpy(native, text.data(), needed);
         return AAFRESULT_SUCCESS;
     }
+    if (element_->NativeSize() == 0 && size != 0) {
+        return AAFRESULT_BAD_SIZE;  // the elements have no layout
+    }
     auto* at = static_cast<std::uint8_t*>(native);
     for (std::size_t i = 0; i < size / ElementSize(); ++i) {
         element_->CopyNative(stored + i * ElementSize(), at + i * element_->NativeSize());

@@ -59,10 +59,13 @@ HRESULT TypeRecord::Setup(const GUID& id, const std::wstring& name, TypeMembers 
     members_ = std::move(members);
     types_ = std::move(types);
     for (TypeDefinition* type : types_) {
-        storedSize_ += type->StoredSize();
         model()->KeepType(*type);
     }
     return AAFRESULT_SUCCESS;
+}
+
+std::size_t TypeRecord::StoredSize() const {
+    return StoredOffset(static_cast<aafUInt32>(members_.size()));
 }
 
 void TypeRecord::UseNaturalLayout() {
@@ -232,7 +235,7 @@ HRESULT TypeRecord::GetValue(IAAFPropertyValue* inPropVal, aafUInt32 index,
     if (const HRESULT result = CheckMember(index); result < 0) {
         return result;
     }
-    if (value->bytes().size() != storedSize_) {
+    if (value->bytes().size() != StoredSize()) {
         return AAFRESULT_BAD_SIZE;
     }
     const auto first = value->bytes().begin() + static_cast<std::ptrdiff_t>(StoredOffset(index));
@@ -251,7 +254,7 @@ HRESULT TypeRecord::GetStruct(IAAFPropertyValue* propVal, aafMemPtr_t data, aafU
     if (const HRESULT result = CheckStruct(dataSize); result < 0) {
         return result;
     }
-    if (value->bytes().size() != storedSize_) {
+    if (value->bytes().size() != StoredSize()) {
         return AAFRESULT_BAD_SIZE;
     }
     CopyNative(value->bytes().data(), data);
@@ -274,7 +277,7 @@ HRESULT TypeRecord::SetValue(IAAFPropertyValue* propVal, aafUInt32 index,
     if (member == nullptr || member->bytes().size() != types_[index]->StoredSize()) {
         return AAFRESULT_BAD_TYPE;
     }
-    value->BytesToChange().resize(storedSize_);
+    value->BytesToChange().resize(StoredSize());
     std::copy(member->bytes().begin(), member->bytes().end(),
               value->BytesToChange().begin() + static_cast<std::ptrdiff_t>(StoredOffset(index)));
     return AAFRESULT_SUCCESS;

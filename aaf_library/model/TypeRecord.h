@@ -23,8 +23,9 @@ public:
     const TypeMembers& members() const { return members_; }
     const std::vector<TypeDefinition*>& types() const { return types_; }
 
-    std::size_t StoredSize() const override { return storedSize_; }
-    std::size_t NativeSize() const override { return nativeSize_; }
+    // Of the members as they are now: a file may say more of an enumeration or a rename.
+    std::size_t StoredSize() const override;
+    std::size_t NativeSize() const override { return LayoutFits() ? nativeSize_ : 0; }
     void AppendStored(const std::uint8_t* native, Bytes& out) const override;
     void CopyNative(const std::uint8_t* stored, std::uint8_t* native) const override;
 
@@ -58,8 +59,7 @@ private:
     TypeMembers members_;
     std::vector<TypeDefinition*> types_;  // of the members
     std::vector<std::size_t> offsets_;    // in the caller's structure
-    std::size_t storedSize_ = 0;
-    std::size_t nativeSize_ = 0;  // 0: no layout yet
+    std::size_t nativeSize_ = 0;          // 0: no layout yet
 };
 
 }  // namespace aaf

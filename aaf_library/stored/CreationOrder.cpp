@@ -144,8 +144,9 @@ const GUID* const kTypes[] = {
     &kAAFTypeID_IdentificationStrongReferenceVector,
 };
 
-// One more property of mobs is built into that library, behind those that we know.
-constexpr wchar_t kLastOfMob[] = L"MobAttributeList";
+// One more property of mobs, MobAttributeList, is built into that library, behind those that we
+// know.
+constexpr GUID kLastOfMob = ncfGuid("60958183-47B1-11D4-A01C-0004AC969F50");
 
 constexpr std::uint32_t kNoKey = 0xFFFFFFFF;
 
@@ -208,7 +209,7 @@ void NumberProperties(StoredProperty& properties, const MetaClass& record) {
         const auto* const place =
             std::find_if(builtIn.begin(), builtIn.end(),
                          [&](const BuiltInProperty& entry) { return entry.key.id == property.id; });
-        const bool isLast = isMob && property.name == kLastOfMob;
+        const bool isLast = isMob && property.id == kLastOfMob;
         properties.localKeys.push_back(place != builtIn.end()
                                            ? static_cast<std::uint32_t>(place - builtIn.begin())
                                        : isLast ? ours

@@ -26,6 +26,8 @@ namespace {
 // A file that is damaged all over would have thousands.
 constexpr std::size_t kMostNotes = 100;
 
+constexpr const char* kOtherForm = "is stored in another form than its type has";
+
 const StoredObject& ContainedIn(const StoredObject& holder, std::uint16_t pid, const char* what) {
     const StoredProperty* property = holder.Find(pid);
     if (property == nullptr || property->form != StoredForm::StrongReference) {
@@ -159,7 +161,7 @@ private:
         const bool fits = from.form == form ||
                           (form == StoredForm::StrongVector && from.form == StoredForm::StrongSet);
         if (!fits) {
-            throw StoredError("is stored in another form than its type has");
+            throw StoredError(kOtherForm);
         }
         if (form == StoredForm::Data) {
             CheckSize(type, from.bytes.size());
@@ -265,11 +267,17 @@ private:
         for (const StoredProperty& property : from.properties) {
             const PropertyDefinition* definition =
                 definitions_.property(dictionary.classDefinition(), property.pid);
-            const bool isSet = definition != nullptr && definition->type() != nullptr &&
-                               property.problem.empty() && property.form == StoredForm::StrongSet &&
-                               StoredFormOf(*definition->type()) == StoredForm::StrongSet;
-            if (isSet) {
+            const bool isSet =
+                definition != nullptr && Dictionary::IsSetOfDefinitions(definition->pid());
+            const bool isRead = isSet && property.problem.empty() &&
+                                (property.form == StoredForm::StrongSet ||
+                                 property.form == StoredForm::StrongVector);
+            if (isRead) {
                 EnterSet(dictionary, *definition, property, entered);
+            } else if (isSet && HasBuiltIn(definition->pid())) {
+                Note(ToUtf8(definition->name()) + ": " +
+                     (property.problem.empty() ? kOtherForm : property.problem) +
+                     "; it is left out");
             } else {
                 others.properties.push_back(property);
             }
@@ -280,6 +288,12 @@ private:
         }
         place_.clear();
         Fill(dictionary, others);
+    }
+
+    // The model's own definitions take the place of whatever would be kept there.
+    static bool HasBuiltIn(PropertyId set) {
+        return set == prop::Dictionary_DataDefinitions.pid ||
+               set == prop::Dictionary_ContainerDefinitions.pid;
     }
 
     struct Entered {
@@ -296,7 +310,8 @@ private:
             const StoredObject& stored = from.objects[i];
             try {
                 const RefPtr<Object> object = NewObject(stored, expected);
-                const Bytes key = KeyOfDefinition(*object, stored, from.keys[i]);
+                const Bytes* const inIndex = from.keys.empty() ? nullptr : &from.keys[i];
+                const Bytes key = KeyOfDefinition(*object, stored, inIndex);
                 RefPtr<Object> known(dictionary.FindDefinition(definition.pid(), GuidOf(key)));
                 if (!known) {
                     if (dictionary.AddDefinition(definition.pid(), object.get()) < 0) {
@@ -312,8 +327,8 @@ private:
         place_.clear();
     }
 
-    // The only property that a definition needs to be found.
-    Bytes KeyOfDefinition(Object& object, const StoredObject& stored, const Bytes& inIndex) {
+    // The only property that a definition needs to be found. A vector has no index of keys.
+    Bytes KeyOfDefinition(Object& object, const StoredObject& stored, const Bytes* inIndex) {
         for (const StoredProperty& property : stored.properties) {
             const PropertyDefinition* definition =
                 definitions_.property(object.classDefinition(), property.pid);
@@ -322,7 +337,11 @@ private:
                 object.RequireValue(definition->key())->BytesToChange() = property.bytes;
             }
         }
-        return KeyOfElement(object, inIndex);
+        const Bytes own = object.UniqueKey();
+        if (inIndex == nullptr && own.empty()) {
+            throw StoredError("a definition without a key");
+        }
+        return KeyOfElement(object, inIndex == nullptr ? own : *inIndex);
     }
 
     Model& model_;

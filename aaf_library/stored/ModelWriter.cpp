@@ -198,11 +198,7 @@ private:
         const auto& kept = static_cast<const KeptProperty&>(*value.asStored());
         TakeAlong(value);
         for (const auto& [set, id] : kept.targets) {
-            if (model_.dictionary().FindDefinition(set, id) != nullptr) {
-                const StoredAuid key = AuidOf(id);
-                targets_[{meta::kRootHeader, prop::Header_Dictionary.pid, set}].insert(
-                    Bytes(key.begin(), key.end()));
-            }
+            keptTargets_.emplace(set, AuidOf(id));
         }
         StoredProperty out = kept.property;
         out.pid = definition.pid();
@@ -211,13 +207,33 @@ private:
         } else if (!out.bytes.empty()) {
             out.bytes = value.bytes();
         }
+        LeadNowhere(out);
         ForEachObject(out, [&](StoredObject& object) {
+            for (StoredProperty& inner : object.properties) {
+                LeadNowhere(inner);
+            }
             if (const GUID id = GuidOf(object.classId); model_.FindClass(id) != nullptr) {
                 closure_.AddClass(id);
             }
             Renumber(object, kept.numbers);
         });
         return out;
+    }
+
+    // A reference that made no sense still has the tag of a set, and the next file may have a set
+    // of that tag. It gets one that none has.
+    static void LeadNowhere(StoredProperty& reference) {
+        if (reference.problem.empty() || !IsWeak(reference.form)) {
+            return;
+        }
+        // In an index the tag stands behind the count.
+        const bool isIndex = reference.form != StoredForm::WeakReference && !reference.name.empty();
+        const std::size_t tag = isIndex ? sizeof(std::uint32_t) : 0;
+        Bytes& bytes = reference.bytes;
+        if (bytes.size() >= tag + sizeof(std::uint16_t)) {
+            std::fill_n(bytes.begin() + static_cast<std::ptrdiff_t>(tag), sizeof(std::uint16_t),
+                        std::uint8_t{0xFF});
+        }
     }
 
     void Renumber(StoredObject& object, const std::unordered_map<std::uint16_t, GUID>& numbers) {
@@ -467,8 +483,15 @@ private:
         return out;
     }
 
-    // A built-in definition may be referred to before anybody has looked it up.
+    // A built-in definition may be referred to before anybody has looked it up. It joins the sets
+    // of the dictionary, so this is no work for the middle of a walk through them.
     void MakeTargets(const Dictionary& dictionary) {
+        for (const auto& [set, key] : keptTargets_) {
+            if (dictionary.FindDefinition(set, GuidOf(key)) != nullptr) {
+                targets_[{meta::kRootHeader, prop::Header_Dictionary.pid, set}].insert(
+                    Bytes(key.begin(), key.end()));
+            }
+        }
         for (const auto& [path, keys] : targets_) {
             if (IsWithinDictionary(path)) {
                 for (const Bytes& key : keys) {
@@ -487,7 +510,8 @@ private:
         const Path path = {meta::kRootHeader, prop::Header_Dictionary.pid, set.pid};
         for (const RefPtr<Object>& definition : definitions) {
             const Bytes key = definition->UniqueKey();
-            const bool wanted = !IsBuiltInContainer(key) || targets_[path].count(key) != 0;
+            const bool wanted = set.pid != prop::Dictionary_ContainerDefinitions.pid ||
+                                !IsBuiltInContainer(key) || targets_[path].count(key) != 0;
             if (wanted && stored.insert(definition.get()).second) {
                 set.keys.push_back(key);
                 set.objects.push_back(StoredObjectOf(*definition));
@@ -546,6 +570,8 @@ private:
     const Object* replaced_ = nullptr;
     const Object* content_ = nullptr;
     std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
+    // The same for what is written as it stands. These may lead to nothing.
+    std::set<std::pair<PropertyId, StoredAuid>> keptTargets_;
     std::unordered_map<const ClassDefinition*, ClassFacts> classes_;
 };
 

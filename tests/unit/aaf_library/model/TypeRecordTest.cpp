@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "aaf_library/model/TypeFacts.h"
 #include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "tests/unit/aaf_library/model/ModelFixture.h"
 
@@ -92,6 +93,41 @@ TEST_F(RecordTypes, LayoutOfAMemberThatGrewIsNoticed) {
     ASSERT_EQ(inner->RegisterMembers(offsets, 4, 64), AAFRESULT_SUCCESS);
     Ptr<IAAFPropertyValue> value;
     EXPECT_EQ(Create(outer, 32, &value), AAFRESULT_ILLEGAL_VALUE);
+    const auto* const type =
+        aaf::ImplementationAs<aaf::TypeDefinition>(As<IAAFTypeDef>(outer).get());
+    std::uint8_t bytes[32] = {};
+    aaf::Bytes stored;
+    EXPECT_EQ(type->Encode(bytes, sizeof bytes, stored), AAFRESULT_BAD_SIZE);
+    EXPECT_EQ(type->Decode(bytes, sizeof bytes, bytes, sizeof bytes), AAFRESULT_BAD_SIZE);
+}
+
+TEST_F(RecordTypes, ArraysOfThoseWithoutALayoutAreNotRead) {
+    const auto box = NewBox();
+    const auto array = NewMeta<IAAFTypeDefVariableArray>(AUID_AAFTypeDefVariableArray);
+    ASSERT_EQ(array->Initialize(kOtherOwnId, As<IAAFTypeDef>(box).get(), L"Boxes"),
+              AAFRESULT_SUCCESS);
+    const auto* const type =
+        aaf::ImplementationAs<aaf::TypeDefinition>(As<IAAFTypeDef>(array).get());
+    std::uint8_t bytes[32] = {};
+    EXPECT_EQ(type->Decode(bytes, sizeof bytes, bytes, sizeof bytes), AAFRESULT_BAD_SIZE);
+    EXPECT_EQ(type->Decode(bytes, 0, bytes, 0), AAFRESULT_SUCCESS);
+}
+
+TEST_F(RecordTypes, ARenameNeverComesToMeanWhatItIsPartOf) {
+    const auto rename = NewMeta<IAAFTypeDefRename>(AUID_AAFTypeDefRename);
+    const auto rational = Type(kAAFTypeID_Rational);
+    ASSERT_EQ(rename->Initialize(kOtherOwnId, rational.get(), L"Other"), AAFRESULT_SUCCESS);
+    const auto member = As<IAAFTypeDef>(rename);
+    ASSERT_EQ(dictionary->RegisterTypeDef(member.get()), AAFRESULT_SUCCESS);
+    const auto outer = NewMeta<IAAFTypeDefRecord>(AUID_AAFTypeDefRecord);
+    IAAFTypeDef* types[] = {member.get()};
+    ASSERT_EQ(outer->Initialize(kOwnId, types, names, 1, L"Outer"), AAFRESULT_SUCCESS);
+    ASSERT_EQ(dictionary->RegisterTypeDef(As<IAAFTypeDef>(outer).get()), AAFRESULT_SUCCESS);
+    aaf::TypeDefinition& type = *model->FindType(kOtherOwnId);
+    aaf::TypeFacts facts = aaf::FactsOf(type);
+    facts.target = kOwnId;
+    EXPECT_TRUE(aaf::Redefine(type, *model, facts));
+    EXPECT_EQ(type.element()->id(), kAAFTypeID_Rational);
 }
 
 TEST_F(RecordTypes, BuiltInRecordsAreRegisteredFromTheStart) {

@@ -30,6 +30,8 @@ using namespace aaf::stored;
 
 namespace {
 
+constexpr GUID kMobAttributeListId = ncfGuid("60958183-47B1-11D4-A01C-0004AC969F50");
+
 struct NumberedClass {
     const char* name;
     const char* properties;
@@ -339,7 +341,7 @@ sample::SampleModel ExtendedModel() {
         ->AddProperty(ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E90"), L"AnotherOfMobs",
                       kAAFTypeID_Int32, true, false);
     sample.model->FindClass(AUID_AAFMob)
-        ->AddProperty(ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E91"), L"MobAttributeList",
+        ->AddProperty(kMobAttributeListId, L"MobAttributeList",
                       kAAFTypeID_TaggedValueStrongReferenceVector, true, false);
     return sample;
 }
@@ -410,6 +412,28 @@ TEST(CreationOrder, OthersComeBehindAllBuiltInOnes) {
     EXPECT_EQ(properties.at("MobAttributeList"), 9u);
     EXPECT_EQ(properties.at("UsageCode"), 8u);
     EXPECT_GE(properties.at("AnotherOfMobs"), 10u);
+}
+
+// A file may have a property of that name and another id, or two of them.
+TEST(CreationOrder, TheLastPropertyOfMobsIsKnownByItsId) {
+    sample::SampleModel sample = ExtendedModel();
+    constexpr GUID other = ncfGuid("10000000-4F5A-4C77-8A01-5B1E2C3D4E91");
+    sample.model->FindClass(AUID_AAFMob)
+        ->AddProperty(other, L"MobAttributeList", kAAFTypeID_TaggedValueStrongReferenceVector, true,
+                      false);
+    StoredObject root = Saved(sample);
+    EXPECT_TRUE(IsWhole(root, sample));
+    Bytes key;
+    const StoredObject& mob = Named(SetOf(root, meta::kClassDefinitions), "Mob", key);
+    const StoredProperty& properties = *mob.Find(meta::kProperties);
+    const auto numberOf = [&](const GUID& id) {
+        const StoredAuid stored = AuidOf(id);
+        const auto at = std::find(properties.keys.begin(), properties.keys.end(),
+                                  Bytes(stored.begin(), stored.end()));
+        return properties.localKeys.at(static_cast<std::size_t>(at - properties.keys.begin()));
+    };
+    EXPECT_EQ(numberOf(kMobAttributeListId), 9u);
+    EXPECT_GE(numberOf(other), 10u);
 }
 
 TEST(CreationOrder, AFileThatAnotherProgramSavesInPlaceLosesNothing) {

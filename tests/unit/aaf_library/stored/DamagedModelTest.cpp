@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/ClassDefinition.h"
+#include "aaf_library/stored/MetaKinds.h"
 #include "aaf_library/stored/MetaPids.h"
 #include "aaf_library/stored/MetaRecords.h"
 #include "aaf_library/stored/ModelReader.h"
@@ -9,6 +10,7 @@
 #include "aaf_library/stored/TreeReader.h"
 #include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
+#include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
@@ -62,6 +64,17 @@ StoredObject& FirstSlot(StoredObject& tree) {
 
 StoredProperty& types(StoredObject& tree) {
     return property(property(tree, 1).objects.front(), meta::kTypeDefinitions);
+}
+
+StoredObject& dictionary(StoredObject& tree) {
+    return property(header(tree), prop::Header_Dictionary.pid).objects.front();
+}
+
+void Erase(StoredObject& object, std::uint16_t pid) {
+    auto& all = object.properties;
+    all.erase(std::remove_if(all.begin(), all.end(),
+                             [pid](const StoredProperty& entry) { return entry.pid == pid; }),
+              all.end());
 }
 
 using Notes = std::vector<std::string>;
@@ -415,6 +428,169 @@ TEST(DamagedModel, AnArrayTypeLargerThanAnyValueIsLeftOut) {
     const sample::SampleModel model = read(tree);
     EXPECT_EQ(model.model->FindType(type.id), nullptr);
     EXPECT_EQ(model.notes, Notes{"the type Huge makes no sense and is left out"});
+}
+
+// Odd references within definitions name built-in ones that nobody has looked up: those join the
+// sets that are being written.
+TEST(DamagedModel, WhatADefinitionRefersToIsMadeWhenItIsWritten) {
+    StoredObject tree = SampleTree();
+    StoredProperty odd;
+    odd.pid = prop::DefinitionObject_Description.pid;
+    odd.form = StoredForm::WeakReference;
+    odd.targetPath = {meta::kRootHeader, prop::Header_Dictionary.pid,
+                      prop::Dictionary_DataDefinitions.pid};
+    odd.keyPid = prop::DefinitionObject_Identification.pid;
+    const StoredAuid edgecode = AuidOf(kAAFDataDef_Edgecode);
+    odd.keys = {Bytes(edgecode.begin(), edgecode.end())};
+    StoredProperty& containers =
+        property(dictionary(tree), prop::Dictionary_ContainerDefinitions.pid);
+    StoredObject& own = containers.objects.at(IndexOf(containers, sample::kOwnDefinitionId));
+    Erase(own, odd.pid);
+    own.properties.push_back(odd);
+    Erase(dictionary(tree), prop::Dictionary_DataDefinitions.pid);
+    StoredProperty& set = mobs(tree);
+    set.objects.clear();
+    set.keys.clear();
+    set.localKeys.clear();
+
+    const sample::SampleModel sample = read(tree);
+    // As many sets as one more makes move.
+    for (const GUID& classId : {AUID_AAFInterpolationDefinition, AUID_AAFKLVDataDefinition,
+                                AUID_AAFTaggedValueDefinition}) {
+        const RefPtr<Object> more = sample.model->CreateObject(*sample.model->FindClass(classId));
+        ASSERT_GE(more->PutStruct(prop::DefinitionObject_Identification, sample::kOwnClassId), 0);
+        ASSERT_GE(more->PutString(prop::DefinitionObject_Name, L"More"), 0);
+        ASSERT_GE(sample.model->dictionary().AddDefinition(classId, more.get()), 0);
+    }
+    ASSERT_EQ(sample.model->dictionary().MadeValues().size(), 4u);
+    StoredObject saved =
+        ReadTree(WriteTree(TreeOfModel(*sample.model, *sample.header), SectorSize::Bytes512));
+    StoredProperty& again = property(dictionary(saved), prop::Dictionary_ContainerDefinitions.pid);
+    StoredObject& ownAgain = again.objects.at(IndexOf(again, sample::kOwnDefinitionId));
+    EXPECT_EQ(property(ownAgain, odd.pid).keys, odd.keys);
+    // Each set that is there, and the one that came in between.
+    EXPECT_EQ(sample.model->dictionary().MadeValues().size(), 5u);
+}
+
+TEST(DamagedModel, AVectorOfDefinitionsIsReadAsASet) {
+    StoredObject tree = SampleTree();
+    const StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+    for (const PropertyKey& key :
+         {prop::Dictionary_DataDefinitions, prop::Dictionary_ContainerDefinitions}) {
+        StoredProperty& set = property(dictionary(tree), key.pid);
+        set.form = StoredForm::StrongVector;
+        set.keys.clear();
+        set.localKeys.clear();
+    }
+    EXPECT_EQ(read(tree).notes, Notes());
+    EXPECT_EQ(passed(tree), before);
+    StoredProperty& containers =
+        property(dictionary(tree), prop::Dictionary_ContainerDefinitions.pid);
+    containers.objects.push_back(containers.objects.front());
+    Erase(containers.objects.back(), prop::DefinitionObject_Identification.pid);
+    EXPECT_EQ(read(tree).notes,
+              Notes{"ContainerDefinitions: a definition without a key; it is left out"});
+    EXPECT_EQ(passed(tree), before);
+}
+
+// Built-in ones come into being in their place, so nothing else can be kept there.
+TEST(DamagedModel, DefinitionsInAnotherFormAreLeftOutAndThatIsTold) {
+    StoredObject tree = SampleTree();
+    StoredObject before = ReadTree(WriteTree(tree, SectorSize::Bytes512));
+    StoredProperty odd;
+    odd.pid = prop::Dictionary_DataDefinitions.pid;
+    odd.bytes = {1, 2, 3};
+    property(dictionary(tree), odd.pid) = odd;
+    EXPECT_EQ(read(tree).notes, Notes{"DataDefinitions: is stored in another form than its type "
+                                      "has; it is left out"});
+    EXPECT_EQ(passed(tree), before);
+    // No operation is built in.
+    odd.pid = prop::Dictionary_OperationDefinitions.pid;
+    dictionary(tree) = dictionary(before);
+    dictionary(tree).properties.push_back(odd);
+    EXPECT_EQ(read(tree).notes, Notes{"OperationDefinitions: is stored in another form than its "
+                                      "type has; it is kept as it stands"});
+    StoredObject again = passed(tree);
+    EXPECT_EQ(property(dictionary(again), odd.pid).bytes, odd.bytes);
+}
+
+// A tag that the file does not have may be one of the next file's.
+TEST(DamagedModel, AReferenceWithAnUnknownTagNeverLeadsSomewhere) {
+    for (const bool isVector : {false, true}) {
+        StoredObject tree = SampleTree();
+        StoredObject& segment = property(FirstSlot(tree), prop::MobSlot_Segment.pid).objects[0];
+        StoredProperty& reference = property(segment, prop::Component_DataDefinition.pid);
+        const Bytes key = reference.keys.front();
+        reference.keys.clear();
+        reference.targetPath.clear();
+        reference.bytes = {1, 0, 0x01, 0x1B, 16};
+        reference.bytes.insert(reference.bytes.end(), key.begin(), key.end());
+        if (isVector) {
+            reference.form = StoredForm::WeakVector;
+            reference.name = u"DataDefinition";
+            reference.bytes.insert(reference.bytes.begin(), {1, 0, 0, 0});
+        }
+        reference.problem = "a weak reference has tag 1, the file has 0 paths";
+        const sample::SampleModel sample = read(tree);
+        ASSERT_EQ(sample.notes.size(), 1u);
+        const sample::SampleModel again = read(
+            ReadTree(WriteTree(TreeOfModel(*sample.model, *sample.header), SectorSize::Bytes512)));
+        ASSERT_EQ(again.notes.size(), 1u);
+        EXPECT_NE(again.notes[0].find("a weak reference has tag 65535"), std::string::npos)
+            << again.notes[0];
+    }
+}
+
+// A record is as long as its members are now.
+TEST(DamagedModel, ARecordFollowsTheWidthOfItsMembers) {
+    const sample::SampleModel made = sample::WholeModel();
+    const aafProductVersion_t version{1, 2, 3, 4, kAAFVersionReleased};
+    const auto identification = [](const sample::SampleModel& sample) -> Object& {
+        return *sample.header->ObjectAt(prop::Header_IdentificationList, 0);
+    };
+    ASSERT_GE(identification(made).PutStruct(prop::Identification_ProductVersion, version), 0);
+    StoredObject tree = TreeOfModel(*made.model, *made.header);
+    StoredObject& release =
+        types(tree).objects.at(IndexOf(types(tree), kAAFTypeID_ProductReleaseType));
+    const StoredAuid wide = AuidOf(kAAFTypeID_UInt64);
+    property(release, TargetPidOf(TypeKind::Enumeration)).keys.at(0) =
+        Bytes(wide.begin(), wide.end());
+
+    const sample::SampleModel sample = read(tree);
+    EXPECT_EQ(sample.notes, Notes{"IdentificationList: ProductVersion: 9 bytes are no value of its "
+                                  "type; it is kept as it stands"});
+    EXPECT_EQ(sample.model->FindType(kAAFTypeID_ProductVersion)->StoredSize(), 16u);
+    aafProductVersion_t got{};
+    EXPECT_EQ(identification(sample).ReadStruct(prop::Identification_ProductVersion, &got),
+              AAFRESULT_PROP_NOT_PRESENT);
+    ASSERT_GE(identification(sample).PutStruct(prop::Identification_ProductVersion, version), 0);
+    const sample::SampleModel again = read(TreeOfModel(*sample.model, *sample.header));
+    EXPECT_EQ(again.notes, Notes());
+    ASSERT_GE(identification(again).ReadStruct(prop::Identification_ProductVersion, &got), 0);
+    EXPECT_EQ(got.type, kAAFVersionReleased);
+    EXPECT_EQ(got.patchLevel, 4);
+}
+
+// A set of definitions that a file adds to those of the dictionary.
+TEST(DamagedModel, ASetOfItsOwnInTheDictionaryKeepsItsElements) {
+    const sample::SampleModel made = sample::WholeModel();
+    constexpr GUID ownSet = ncfGuid("9D2C1F10-4F5A-4C77-8A01-5B1E2C3D4E92");
+    const PropertyDefinition& more =
+        made.model->FindClass(AUID_AAFDictionary)
+            ->AddProperty(ownSet, L"MoreContainers",
+                          kAAFTypeID_ContainerDefinitionStrongReferenceSet, true, false);
+    // The second has the id of one that is built in elsewhere.
+    for (const GUID& id : {sample::kOwnClassId, BuiltInContainerDefinitions().begin()->id}) {
+        const RefPtr<Object> element =
+            made.model->CreateObject(*made.model->FindClass(AUID_AAFContainerDefinition));
+        ASSERT_GE(element->PutStruct(prop::DefinitionObject_Identification, id), 0);
+        ASSERT_GE(element->PutString(prop::DefinitionObject_Name, L"More"), 0);
+        ASSERT_GE(made.model->dictionary().AddToSet(more.key(), element->Identity()), 0);
+    }
+    StoredObject tree = TreeOfModel(*made.model, *made.header);
+    ASSERT_EQ(property(dictionary(tree), more.pid()).objects.size(), 2u);
+    EXPECT_EQ(read(tree).notes, Notes());
+    EXPECT_EQ(passed(tree), ReadTree(WriteTree(tree, SectorSize::Bytes512)));
 }
 
 // Every number, key, name and value of the tree changed in turn.
