@@ -46,7 +46,6 @@ std::string FrameRequest::ToBytes() const {
         .Add(std::uint64_t{wanted.isOne})
         .Add(std::uint64_t{wanted.areBelieved})
         .Add(std::uint64_t{jobs})
-        .Add(behind)
         .bytes();
 }
 
@@ -61,7 +60,6 @@ FrameRequest FrameRequest::From(std::string_view bytes) {
     request.wanted.isOne = fields.Number() != 0;
     request.wanted.areBelieved = fields.Number() != 0;
     request.jobs = static_cast<unsigned>(fields.Number());
-    request.behind = fields.Number();
     return request;
 }
 
@@ -72,7 +70,7 @@ std::string FrameAnswer::ToBytes() const {
         .Add(plan.frameBytes)
         .Add(plan.rawWords)
         .Add(written);
-    fields.Add(Size(width)).Add(Size(height)).Add(std::uint64_t{plan.isInOneGo});
+    fields.Add(Size(width)).Add(Size(height)).Add(std::uint64_t{plan.leanOnEachOther});
     fields.Add(std::uint64_t{plan.cuts.size()});
     for (const std::uint64_t cut : plan.cuts) {
         fields.Add(cut);
@@ -90,7 +88,7 @@ bool FrameAnswer::Read(std::string_view bytes, const FrameRequest& request) {
     written = fields.Text();
     width = static_cast<int>(fields.Number());
     height = static_cast<int>(fields.Number());
-    plan.isInOneGo = fields.Number() != 0;
+    plan.leanOnEachOther = fields.Number() != 0;
     const std::uint64_t cuts = fields.Number();
     if (cuts > bytes.size() / kLengthSize) {
         return false;

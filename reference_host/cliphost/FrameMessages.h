@@ -17,8 +17,6 @@ struct FrameRequest {
     Kind kind = Kind::Plan;
     WantedFrames wanted;
     unsigned jobs = 1;  // for the plan
-    // The first of the frames that a piece is read behind; its own first where it stands alone.
-    std::uint64_t behind = 0;
 
     std::string ToBytes() const;
     static FrameRequest From(std::string_view bytes);  // from the parent, which is trusted

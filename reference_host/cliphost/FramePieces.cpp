@@ -71,7 +71,10 @@ private:
     bool Read(std::size_t, const std::string& answer) override {
         return answer_.Read(answer, request_);
     }
-    void Take(std::size_t, const WorkerResult& result) override { result_ = result; }
+    bool Take(std::size_t, const WorkerResult& result) override {
+        result_ = result;
+        return true;
+    }
     void Ask() { RunInWorkers(options_.workers, {request_.ToBytes()}, *this); }
 
     const FrameOptions& options_;
@@ -91,7 +94,7 @@ private:
     bool Read(std::size_t number, const std::string& answer) override {
         return answers_[number].Read(answer, requests_[number]);
     }
-    void Take(std::size_t number, const WorkerResult& result) override;
+    bool Take(std::size_t number, const WorkerResult& result) override;
     MadeFrame Made(std::size_t number, const std::filesystem::path& folder, std::size_t i) const;
     Problem WhyLost(std::size_t number, const WorkerResult& result) const;
     void TakeFrames(std::size_t number, const std::filesystem::path& folder);
@@ -100,28 +103,29 @@ private:
                          Problem problem) const;
 
     std::uint64_t frameBytes_ = 0;
+    bool leanOnEachOther_ = false;
     std::vector<FrameRequest> requests_;
     std::map<std::size_t, FrameAnswer> answers_;  // that were read and not yet taken
 };
 
 void RunInPieces::WriteAll(const FramePlan& plan) {
     frameBytes_ = plan.frameBytes;
+    leanOnEachOther_ = plan.leanOnEachOther;
     std::uint64_t longest = 1;
     std::vector<std::string> messages;
     for (std::size_t i = 0; i <= plan.cuts.size(); ++i) {
         const std::uint64_t begin = i == 0 ? 0 : plan.cuts[i - 1];
         const std::uint64_t end = i == plan.cuts.size() ? plan.count : plan.cuts[i];
-        FrameRequest piece{sink().IsRaw() ? Kind::Raw : Kind::Pictures, {}, 1, 0};
+        FrameRequest piece{sink().IsRaw() ? Kind::Raw : Kind::Pictures, {}, 1};
         piece.wanted.range = {NumberOf(begin), NumberOf(end - 1) + 1, wanted().range.step};
-        piece.behind = NumberOf(plan.isInOneGo ? 0 : begin);
         longest = std::max(longest, end - begin);
         requests_.push_back(piece);
         messages.push_back(piece.ToBytes());
     }
     WorkerCall call = options().workers;
     call.writeNear = FolderNearOutput();
-    call.jobs = plan.isInOneGo ? 1 : call.jobs;
-    call.mostWaiting = MostPiecesWaiting(longest, plan.frameBytes, call.jobs);
+    call.leanOnEachOther = leanOnEachOther_;
+    call.mostWaiting = MostPiecesWaiting(longest, plan.frameBytes, call.Processes());
     RunInWorkers(call, messages, *this);
 }
 
@@ -135,22 +139,25 @@ std::filesystem::path RunInPieces::FolderNearOutput() const {
     return std::filesystem::is_directory(place, ignored) ? place : place.parent_path();
 }
 
-void RunInPieces::Take(std::size_t number, const WorkerResult& result) {
+bool RunInPieces::Take(std::size_t number, const WorkerResult& result) {
     // A process that ended before has told nothing new.
     if (const std::size_t opening = result.told.find(kEndOfOpening); opening != std::string::npos) {
         Notice("{}", result.told.substr(opening + 1));
     }
-    const FrameRange& range = requests_[number].wanted.range;
-    if (Problem why = WhyLost(number, result)) {
-        Count(0, range.CountIn(*range.end));
+    Problem why = WhyLost(number, result);
+    if (why) {
+        FrameRange lost = requests_[number].wanted.range;
+        lost.end = (leanOnEachOther_ ? requests_.back() : requests_[number]).wanted.range.end;
+        Count(0, lost.CountIn(*lost.end));
         why.subject = options().movie;
-        why.reason = fmt::format("{} left out: {}", FramesInWords(range), why.reason);
+        why.reason = fmt::format("{} left out: {}", FramesInWords(lost), why.reason);
         TellProblem(why, options().workers.verbosity);
         RemovePrivateFiles(result.folder, number);
     } else {
         TakeFrames(number, result.folder);
     }
     answers_.erase(number);
+    return !why || !leanOnEachOther_;
 }
 
 // Frames of a piece are counted from 0.
@@ -249,13 +256,8 @@ private:
             turn_ = isRaw ? PictureTurn() : form_.turn.TurnFor(movie_);
         }
         std::fputc(kEndOfOpening, stderr);
-        for (std::uint64_t before = request.behind; before < range.first && next_ != range.first;
-             before += range.step) {
-            source_->Pass(before);
-        }
         for (std::uint64_t i = 0, count = range.CountIn(*range.end); i < count; ++i) {
             const std::uint64_t frame = range.first + i * range.step;
-            next_ = frame + range.step;
             const bool isRead = source_->Read(frame);
             if (isRead) {
                 const MadeFrame made =
@@ -274,7 +276,6 @@ private:
     const FrameForm& form_;
     std::optional<FrameSource> source_;
     std::optional<PictureTurn> turn_;
-    std::uint64_t next_ = 0;  // behind the frame read last
 };
 
 }  // namespace

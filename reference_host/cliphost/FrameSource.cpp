@@ -128,7 +128,7 @@ void FrameSource::Cut(FramePlan& plan, const FrameRange& range, unsigned jobs) {
         plan.cuts.push_back(cut);
         begin = cut;
     }
-    plan.isInOneGo = !plan.cuts.empty() && !TellsWhatStandsAlone();
+    plan.leanOnEachOther = !plan.cuts.empty() && !TellsWhatStandsAlone();
 }
 
 // By the order of decoding, which differs little from that of the frames.
@@ -153,18 +153,11 @@ bool FrameSource::TellsWhatStandsAlone() {
     return host::AreCodedAlone(essence_.movie());
 }
 
-NCFRESULT FrameSource::ReadBoth(std::uint64_t frame) {
-    const NCFRESULT result = reader_->Read(frame);
-    return result == NCF_OK && alpha_ ? alpha_->Read(frame) : result;
-}
-
-void FrameSource::Pass(std::uint64_t frame) {
-    ReadBoth(frame);
-    essence_.session().TakeNotices();
-}
-
 bool FrameSource::Read(std::uint64_t frame) {
-    const NCFRESULT result = ReadBoth(frame);
+    NCFRESULT result = reader_->Read(frame);
+    if (result == NCF_OK && alpha_) {
+        result = alpha_->Read(frame);
+    }
     if (result != NCF_OK) {
         essence_.session().TakeNotices();
         Problem problem = essence_.WhyUnread(track_, frame, result);

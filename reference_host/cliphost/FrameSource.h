@@ -41,8 +41,8 @@ struct FramePlan {
     std::uint64_t frameBytes = 0;     // as they are delivered
     std::string rawWords;             // as RawWords
     std::vector<std::uint64_t> cuts;  // where further pieces of the range begin, counted in frames
-    // Nothing tells which frames stand alone: each piece is read behind those before it.
-    bool isInOneGo = false;
+    // Nothing tells which frames stand alone: what a piece needs may lie in any before it.
+    bool leanOnEachOther = false;
 };
 
 // How many frames a piece of a range has, and how many at most where no frame to end before is
@@ -69,8 +69,6 @@ public:
     void Cut(FramePlan& plan, const FrameRange& range, unsigned jobs);
     // Tells why a frame can't be read.
     bool Read(std::uint64_t frame);
-    // Reads it for those behind it.
-    void Pass(std::uint64_t frame);
 
     // Of the frame read last.
     const FrameReader& reader() const { return *reader_; }
@@ -80,7 +78,6 @@ private:
     std::uint64_t CountTo(const WantedFrames& wanted);
     bool StandsAlone(std::uint64_t frame);
     bool TellsWhatStandsAlone();
-    NCFRESULT ReadBoth(std::uint64_t frame);
 
     Essence essence_;
     const ClipTrack track_;

@@ -250,7 +250,7 @@ bool MoviesRun::Read(std::size_t number, const std::string& answer) {
     return ReadAnswer(answer, answers_[number]);
 }
 
-void MoviesRun::Take(std::size_t number, const WorkerResult& result) {
+bool MoviesRun::Take(std::size_t number, const WorkerResult& result) {
     const std::size_t place = placesOfRequests_[number];
     TellThoseBefore(place);
     ++nextPlace_;
@@ -259,6 +259,7 @@ void MoviesRun::Take(std::size_t number, const WorkerResult& result) {
     Notice("{}", result.told);
     GoOnAfterFailure(step.movie, [&] { Deliver(place, step, number, result); });
     answers_.erase(number);
+    return true;
 }
 
 void MoviesRun::Deliver(std::size_t place, const MovieStep& step, std::size_t number,

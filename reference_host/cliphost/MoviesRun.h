@@ -73,7 +73,7 @@ private:
     void TellInstead(std::size_t place);
     void TellThoseBefore(std::size_t place);
     bool Read(std::size_t number, const std::string& answer) override;
-    void Take(std::size_t number, const WorkerResult& result) override;
+    bool Take(std::size_t number, const WorkerResult& result) override;
     void Deliver(std::size_t place, const MovieStep& step, std::size_t number,
                  const WorkerResult& result);
     void Settle(std::size_t place, const MovieStep& step, const MovieAnswer& answer,

@@ -43,9 +43,11 @@ const WorkerWords kManyMovies = {
 const WorkerWords kManyFrames = {
     "Many frames at once",
     "How many processes that can do little else read pieces of the range at the same time; what "
-    "the movie does to one costs that piece alone. With 1, where the range names fewer than 24 "
-    "frames, where the output is a pipe or a device, and for raw frames unless this is given, this "
-    "process reads. Of a damaged movie, pieces can have other frames than one process reads",
+    "the movie does to one costs that piece alone. Where nothing tells which frames can be decoded "
+    "without those before, one process reads all pieces, and all behind a lost one are lost. With "
+    "1, where the range names fewer than 24 frames, where the output is a pipe or a device, and "
+    "for raw frames unless this is given, this process reads. Of a damaged movie, pieces can have "
+    "other frames than one process reads",
     "Give a piece of the range up that takes longer; opening the movie and counting its frames may "
     "take as long before. Frames are then read by such processes, whatever --jobs and the output "
     "are",

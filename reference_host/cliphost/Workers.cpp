@@ -70,7 +70,7 @@ public:
     Run(const WorkerCall& call, const WorkerRequests& requests, WorkerClient& client)
         : call_(call), requests_(requests), client_(client) {
         MakeScratchFolder();
-        const std::size_t most = std::min<std::size_t>(call.jobs, requests.count);
+        const std::size_t most = std::min<std::size_t>(call.Processes(), requests.count);
         for (std::size_t i = 0; i < most; ++i) {
             workers_.push_back(std::make_unique<Worker>());
         }
@@ -148,7 +148,9 @@ void Run::GoOn() {
         for (auto first = waiting_.find(taken_);
              first != waiting_.end() && !host::system::DelayedSignals::HaveCome();
              first = waiting_.find(taken_)) {
-            client_.Take(first->first, first->second);
+            if (!client_.Take(first->first, first->second)) {
+                return;
+            }
             waiting_.erase(first);
             ++taken_;
         }
@@ -321,7 +323,7 @@ void Run::Hear(Worker& worker, const std::string& message) {
     ++worker.answered;
     Settle(worker, "");
     // What it holds would be laid to the movies after this one.
-    if (needed > most / 2) {
+    if (needed > most / 2 && !call_.leanOnEachOther) {
         worker.process.End();
     }
 }
@@ -357,7 +359,8 @@ void Run::Lose(Worker& worker, const std::string& why) {
     if (!worker.isReady) {
         Notice("{}", TakeTold(worker));
         GiveUp(worker, "a process that reads movies did not start");
-    } else if (worker.answered > 0 && retried_.insert(worker.requests.front()).second) {
+    } else if (worker.answered > 0 && !call_.leanOnEachOther &&
+               retried_.insert(worker.requests.front()).second) {
         TakeTold(worker);  // it may have come to harm by a movie before: a process of its own tells
     } else {
         Settle(worker, why);

@@ -34,6 +34,11 @@ struct WorkerCall {
     int verbosity = 0;
     // Results that wait for one before them; no more requests are begun than that.
     std::size_t mostWaiting = 256;
+    // All are of one movie, and the process needs what it read for those before: one process is
+    // given them in order, none twice, and what memory it holds is theirs.
+    bool leanOnEachOther = false;
+
+    unsigned Processes() const { return leanOnEachOther ? 1 : jobs; }
 };
 
 // Throws a Failure where limits are set for a movie that no other process can open.
@@ -53,8 +58,8 @@ public:
     // Keeps an answer, which may be anything: the process has met the movie. False for what is
     // none; the process then ends. Answers come in any order.
     virtual bool Read(std::size_t number, const std::string& answer) = 0;
-    // The result, in the order of the requests.
-    virtual void Take(std::size_t number, const WorkerResult& result) = 0;
+    // The result, in the order of the requests. False where those behind it are wanted no more.
+    virtual bool Take(std::size_t number, const WorkerResult& result) = 0;
 };
 
 // Requests that are put together when they are sent.

@@ -529,17 +529,44 @@ TEST_F(JobsOfFrames, WriteTheSameOfAMovieThatDoesNotListItsSyncSamples) {
     }
 }
 
-// After a lost piece, the frames that the next one leans on are decoded anew.
-TEST_F(JobsOfFrames, ReadOnBehindALostPieceFromWhereAllBegan) {
-    const auto movie = Movie("crash-at-40.mov", "-c:v rpza");
-    const std::string call = "frame " + Quoted(movie) + " --range 0: --jobs 2 -o ";
-    ASSERT_EQ(RunCliphost(call + In("whole")).status, 0);
-    ExpectSays(Harmed(call + In("some")), 1, "frames 39 to 51 are left out: ");
-    const auto pictures = NamesIn(folder() / "some");
-    EXPECT_EQ(pictures.size(), 39u);
-    for (const std::string& name : pictures) {
-        EXPECT_TRUE(ReadFile(folder() / "some" / name) == ReadFile(folder() / "whole" / name));
+// Nothing tells which frames those behind a lost piece lean on: all of them are lost with it.
+TEST_F(JobsOfFrames, LoseTheRestInOneLineWherePiecesLeanOnEachOther) {
+    const auto movie = Movie("whole.mov", "-c:v rpza");
+    const std::string rest = " --range 0: --jobs 2 --limit-seconds 4 -o ";
+    ASSERT_EQ(RunCliphost("frame " + Quoted(movie) + rest + In("whole")).status, 0);
+    const std::pair<const char*, const char*> harms[] = {
+        {"crash-at-40", "the process that read it was ended by signal 11"},
+        {"hang-at-41", "took longer than 4 seconds"},
+        {"throw-at-42", "thrown by the module"},
+        {"remove-at-43", "the process that read it left no whole file of frame 39"}};
+    for (const auto& [harm, why] : harms) {
+        SCOPED_TRACE(harm);
+        const std::string name = std::string(harm) + ".mov";
+        std::filesystem::copy_file(movie, folder() / "in" / name);
+        const CommandResult ran = Harmed("frame " + In("in/" + name) + rest + In(harm));
+        ExpectSays(ran, 1,
+                   Line(name, std::string("frames 39 to 95 are left out: ") + why) +
+                       (folder() / harm).string() + ": 39 pictures\n");
+        EXPECT_EQ(CountOf(ran.out, "left out"), 1u) << ran.out;
+        for (int i = 0; i < 39; ++i) {
+            const std::string frame = (i < 10 ? "_00000" : "_0000") + std::to_string(i) + ".png";
+            EXPECT_TRUE(ReadFile(folder() / harm / (harm + frame)) ==
+                        ReadFile(folder() / "whole" / ("whole" + frame)))
+                << frame;
+        }
     }
+}
+
+// All memory of the process is this movie's. Each further process would take frame 0 again, which
+// tells of itself.
+TEST_F(JobsOfFrames, KeepTheirProcessWherePiecesLeanOnEachOther) {
+    const auto movie = Movie("hog-at-0.mov", "-c:v rpza");
+    const std::string call = "frame " + Quoted(movie) + " --range 0: --jobs 2 -o ";
+    ASSERT_EQ(RunCliphost(call + In("whole.raw")).status, 0);
+    const CommandResult ran = Harmed(call + In("a.raw") + " --limit-memory 2000");
+    ExpectSays(ran, 0, ": 96 raw frames\n");
+    EXPECT_EQ(CountOf("\n" + ran.out, "\n1\n"), 1u) << ran.out;
+    EXPECT_TRUE(ReadFile(folder() / "a.raw") == ReadFile(folder() / "whole.raw"));
 }
 
 TEST_F(JobsOfFrames, TellFramesThatCantBeReadInOrder) {

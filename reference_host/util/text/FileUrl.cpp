@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/util/text/FileUrl.h"
 
+#include <algorithm>
+
 namespace host::text {
 
 namespace {
@@ -21,6 +23,14 @@ int DigitValue(char c) {
     }
     const char upper = static_cast<char>(c & ~0x20);
     return upper >= 'A' && upper <= 'F' ? upper - 'A' + 10 : -1;
+}
+
+// Names of machines are the same in capitals.
+bool IsThisMachine(std::string_view name) {
+    return std::equal(name.begin(), name.end(), kThisMachine.begin(), kThisMachine.end(),
+                      [](char c, char small) {
+                          return c == small || (c >= 'A' && c <= 'Z' && (c | 0x20) == small);
+                      });
 }
 
 }  // namespace
@@ -78,7 +88,7 @@ bool SplitFileUrl(std::string_view url, std::string& machine, std::string& path)
         ofPath.find('\0') != std::string::npos) {
         return false;
     }
-    machine = ofMachine == kThisMachine ? std::string() : std::move(ofMachine);
+    machine = IsThisMachine(ofMachine) ? std::string() : std::move(ofMachine);
     path = std::move(ofPath);
     return true;
 }

@@ -43,7 +43,6 @@ TEST(FrameMessages, ComeBackAsTheyWere) {
     request.wanted.isOne = true;
     request.wanted.areBelieved = true;
     request.jobs = 7;
-    request.behind = 2;
     const FrameRequest asked = FrameRequest::From(request.ToBytes());
     EXPECT_EQ(asked.kind, Kind::Pictures);
     EXPECT_EQ(asked.wanted.range.first, 5u);
@@ -52,7 +51,6 @@ TEST(FrameMessages, ComeBackAsTheyWere) {
     EXPECT_TRUE(asked.wanted.isOne);
     EXPECT_TRUE(asked.wanted.areBelieved);
     EXPECT_EQ(asked.jobs, 7u);
-    EXPECT_EQ(asked.behind, 2u);
     EXPECT_EQ(FrameRequest::From(Request(Kind::Plan, 1, {}).ToBytes()).wanted.range.CountIn(10),
               3u);
 
@@ -65,7 +63,7 @@ TEST(FrameMessages, ComeBackAsTheyWere) {
     EXPECT_EQ(read.plan.count, 20u);
     EXPECT_EQ(read.plan.frameBytes, 1000u);
     EXPECT_EQ(read.plan.rawWords, "words");
-    EXPECT_TRUE(read.plan.isInOneGo);
+    EXPECT_TRUE(read.plan.leanOnEachOther);
     EXPECT_EQ(read.plan.cuts, (std::vector<std::uint64_t>{5, 9}));
     EXPECT_EQ(read.width, 64);
     EXPECT_EQ(read.height, 48);

@@ -53,10 +53,13 @@ public:
         answers[number] = fields.Text();
         return fields.IsWhole();
     }
-    void Take(std::size_t number, const WorkerResult& result) override {
+    bool Take(std::size_t number, const WorkerResult& result) override {
         taken.push_back(number);
         results.push_back(result);
+        return result.failure.empty() || !endsAtFailure;
     }
+
+    bool endsAtFailure = false;
 
     std::map<std::size_t, std::string> answers;
     std::vector<std::size_t> taken;
@@ -144,6 +147,67 @@ TEST(Workers, LoseTheRequestAloneThatEndsEveryProcess) {
     }
 }
 
+// Shells that note each start, and how often that was.
+class WorkersInOrder : public testing::Test {
+protected:
+    void TearDown() override { std::filesystem::remove(starts_); }
+    Client Run(const std::string& script, bool leanOnEachOther, const WorkerLimits& limits = {}) {
+        std::filesystem::remove(starts_);
+        WorkerCall call;
+        call.program = "/bin/sh";
+        call.arguments = {"-c", "echo >>'" + starts_.string() + "'\n" + script};
+        call.jobs = 2;
+        call.limits = limits;
+        call.leanOnEachOther = leanOnEachOther;
+        Client client;
+        client.endsAtFailure = true;
+        RunInWorkers(call, std::vector<std::string>(5, "x"), client);
+        return client;
+    }
+    std::uintmax_t Starts() const { return std::filesystem::file_size(starts_); }
+
+private:
+    const std::filesystem::path starts_ =
+        std::filesystem::path(testing::TempDir()) / ("starts-" + std::to_string(getpid()));
+};
+
+TEST_F(WorkersInOrder, AreOneProcessWhateverItHolds) {
+    // 40 MB stay with it from the start.
+    const std::string script = "x=$(head -c 40000000 /dev/zero | tr '\\0' x)\n" + Ready() +
+                               "while true\ndo\n" + Request() + Answer("fine") + "done\n";
+    EXPECT_EQ(Run(script, true, {0, 120}).answers.size(), 5u);
+    EXPECT_EQ(Starts(), 1u);
+    EXPECT_EQ(Run(script, false, {0, 120}).answers.size(), 5u);
+    EXPECT_GE(Starts(), 5u) << "the script doesn't hold enough";
+}
+
+TEST_F(WorkersInOrder, TryNothingTwiceAndNothingBehindALoss) {
+    const std::string script =
+        Ready() + Request() + Answer("fine") + Request() + Answer("fine") + Request() + "exit 7";
+    const Client client = Run(script, true);
+    EXPECT_EQ(Starts(), 1u);
+    EXPECT_EQ(client.taken, (std::vector<std::size_t>{0, 1, 2}));
+    EXPECT_EQ(client.results.back().failure,
+              "the process that read it ended with status 7 and without an answer");
+}
+
+TEST_F(WorkersInOrder, HaveTheTimeLimitForEachRequest) {
+    const std::string script =
+        Ready() + "while true\ndo\n" + Request() + "sleep 0.7\n" + Answer("fine") + "done\n";
+    EXPECT_EQ(Run(script, true, {2, 0}).answers.size(), 5u);
+    EXPECT_EQ(Starts(), 1u);
+}
+
+TEST(Workers, AreAskedForNoMoreThanTheirClientWants) {
+    WorkerCall call;
+    call.program = "/bin/sh";
+    call.arguments = {"-c", Ready() + Request() + "kill -SEGV $$"};
+    Client client;
+    client.endsAtFailure = true;
+    RunInWorkers(call, std::vector<std::string>(6, "x"), client);
+    EXPECT_EQ(client.taken.size(), 1u);
+}
+
 TEST(Workers, GetRequestsThatAChannelDoesNotHold) {
     WorkerCall call;
     call.program = "/bin/sh";
@@ -159,9 +223,9 @@ TEST(Workers, GetRequestsThatAChannelDoesNotHold) {
 TEST(Workers, AreNotChargedWithTimeInWhichNobodyListens) {
     class SlowClient : public Client {
     public:
-        void Take(std::size_t number, const WorkerResult& result) override {
-            Client::Take(number, result);
+        bool Take(std::size_t number, const WorkerResult& result) override {
             std::this_thread::sleep_for(std::chrono::milliseconds(1500));
+            return Client::Take(number, result);
         }
     };
     const std::string answer = FieldWriter().Add(std::string(300000, '\0')).Message();

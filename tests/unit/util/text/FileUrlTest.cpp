@@ -55,6 +55,18 @@ TEST(SplitFileUrl, GivesTheMachineAndThePath) {
     EXPECT_EQ(path, "/a b/c");
     EXPECT_TRUE(host::text::SplitFileUrl("file://localhost/c", machine, path));
     EXPECT_EQ(machine, "") << "this machine";
+    EXPECT_TRUE(host::text::SplitFileUrl("file://Server/c", machine, path));
+    EXPECT_EQ(machine, "Server") << "as it is written";
+}
+
+TEST(SplitFileUrl, KnowsThisMachineInCapitalsToo) {
+    for (const char* const url :
+         {"file://LOCALHOST/a", "file://Localhost/a", "file://local%48ost/a"}) {
+        std::string machine = "before", path;
+        EXPECT_TRUE(host::text::SplitFileUrl(url, machine, path)) << url;
+        EXPECT_EQ(machine, "") << url;
+        EXPECT_EQ(path, "/a") << url;
+    }
 }
 
 TEST(SplitFileUrl, LeavesBothAloneWhereItFails) {
