@@ -23,6 +23,8 @@ MovieAnswer AnswerSafely(const std::filesystem::path& movie,
                          const std::function<MovieAnswer()>& answer) {
     try {
         return answer();
+    } catch (const ReaderGone&) {
+        throw;  // not the movie's fault
     } catch (const Failure& failure) {
         return Failed(failure.status(), failure.problem());
     } catch (const host::MovieLibraryMissing& missing) {

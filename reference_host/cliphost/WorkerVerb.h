@@ -24,7 +24,7 @@ CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker
 void Serve(Session& session, const WorkerVerb& worker,
            const std::function<std::string(std::uint64_t, const std::string&)>& answer);
 
-// One movie's answer, whatever happens to it.
+// One movie's answer, whatever happens to it. Throws ReaderGone alone.
 MovieAnswer AnswerSafely(const std::filesystem::path& movie,
                          const std::function<MovieAnswer()>& answer);
 
