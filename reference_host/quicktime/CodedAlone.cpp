@@ -40,14 +40,14 @@ bool IsOneOf(const Value (&values)[kCount], Value value) {
     return std::find(std::begin(values), std::end(values), value) != std::end(values);
 }
 
+}  // namespace
+
 bool IsCodedAlone(const AVCodecParameters& form) {
     const AVCodecDescriptor* const codec = avcodec_descriptor_get(form.codec_id);
     return (codec && (codec->props & AV_CODEC_PROP_INTRA_ONLY) != 0) ||
            IsOneOf(kIntraCodecs, form.codec_id) ||
            IsOneOf(kIntraCodes, CodeOfTag(form.codec_tag)) || IsIntraProfile(form);
 }
-
-}  // namespace
 
 bool AreCodedAlone(const std::filesystem::path& movie) {
     std::string ignored;
