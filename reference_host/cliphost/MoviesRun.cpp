@@ -194,7 +194,7 @@ void MoviesRun::RunHere() {
         }
         GoOnAfterFailure(step.movie, [&] {
             std::filesystem::path saved;
-            const MovieAnswer answer = AnswerSafely(step.movie, [&] {
+            const MovieAnswer answer = AnswerOfMovie(step.movie, [&] {
                 return Answer(step, [&] {
                     saved = options_.Saves() ? TargetFor(i, step) : std::filesystem::path();
                     return saved;

@@ -36,6 +36,12 @@ TEST(AnswerSafely, TellsAProgramThatLacksALibrary) {
     EXPECT_EQ(answer.problem.reason, "no library");
 }
 
+TEST(AnswerOfMovie, IsNoneWhereTheProgramLacksALibrary) {
+    EXPECT_THROW(
+        AnswerOfMovie("a.mov", []() -> MovieAnswer { throw host::MovieLibraryMissing("none"); }),
+        host::MovieLibraryMissing);
+}
+
 TEST(AnswerSafely, LeavesAReaderThatHasGoneToTheRun) {
     EXPECT_THROW(AnswerTo(ReaderGone()), ReaderGone);
 }
