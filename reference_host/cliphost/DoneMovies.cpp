@@ -32,8 +32,8 @@ bool StartsWith(const std::string& text, std::string_view start) {
 
 // Options that change what is shown, or that name files which count by their content.
 bool ChangesNoOutput(const std::string& argument) {
-    static constexpr std::string_view kNames[] = {"-v",      "-q",       "--quiet",      "--json",
-                                                  "--jsonl", "--plugin", "--aaf-library"};
+    static constexpr std::string_view kNames[] = {
+        "-v", "-q", "--quiet", "--json", "--jsonl", "--plugin", "--aaf-library", "--no-config"};
     return std::any_of(std::begin(kNames), std::end(kNames), [&](std::string_view name) {
         return StartsWith(argument, name) &&
                (argument.size() == name.size() || argument[name.size()] == '=');
