@@ -5,7 +5,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cctype>
 #include <cerrno>
 #include <cstdlib>
 #include <fstream>
@@ -13,170 +12,15 @@
 #include <vector>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/SettingsText.h"
 
 namespace cliphost {
 namespace {
-
-constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
-constexpr char kHint[] = "write it such as `jobs = 4` or `[describe]`";
 
 [[noreturn]] void Refuse(const std::filesystem::path& file, int line, const std::string& reason,
                          const std::string& hint) {
     throw Failure(kExitCaller, file, fmt::format("line {}: {}", line, reason), hint);
 }
-
-bool IsOfName(char c) {
-    return std::isalnum(static_cast<unsigned char>(c)) != 0 || c == '-' || c == '_';
-}
-
-// A text from its start to its end, with the number of the line.
-class SettingsText {
-public:
-    SettingsText(const std::filesystem::path& file, std::string_view text)
-        : file_(file), text_(text) {
-        if (text_.substr(0, kByteOrderMark.size()) == kByteOrderMark) {
-            at_ = kByteOrderMark.size();
-        }
-    }
-
-    std::vector<FileSetting> Read() {
-        while (SkipToNext(true)) {
-            if (text_[at_] == '[') {
-                settings_.push_back({section_ = SectionName(), {}, {}, line_});
-            } else {
-                AddSetting();
-            }
-            if (SkipToNext(false) && text_[at_] != '\n') {
-                Fail("more stands behind it");
-            }
-        }
-        return std::move(settings_);
-    }
-
-private:
-    [[noreturn]] void Fail(const std::string& reason) const { Refuse(file_, line_, reason, kHint); }
-    bool IsAt(char c) const { return at_ < text_.size() && text_[at_] == c; }
-
-    // Over spaces and comments; and line ends, where they mean nothing. False at the end.
-    bool SkipToNext(bool overLines) {
-        for (; at_ < text_.size(); ++at_) {
-            const char c = text_[at_];
-            if (c == '#') {
-                at_ = std::min(text_.find('\n', at_), text_.size()) - 1;
-            } else if (c == '\n' && overLines) {
-                ++line_;
-            } else if (c != ' ' && c != '\t' && c != '\r') {
-                return true;
-            }
-        }
-        return false;
-    }
-
-    std::string Name() {
-        const std::size_t start = at_;
-        while (at_ < text_.size() && IsOfName(text_[at_])) {
-            ++at_;
-        }
-        return std::string(text_.substr(start, at_ - start));
-    }
-
-    std::string SectionName() {
-        ++at_;
-        SkipToNext(false);
-        std::string name = Name();
-        SkipToNext(false);
-        if (name.empty() || !IsAt(']')) {
-            Fail("is no section");
-        }
-        ++at_;
-        return name;
-    }
-
-    void AddSetting() {
-        FileSetting setting{section_, Name(), {}, line_};
-        SkipToNext(false);
-        if (setting.name.empty() || !IsAt('=')) {
-            Fail("is no setting");
-        }
-        ++at_;
-        SkipToNext(false);
-        for (const FileSetting& known : settings_) {
-            if (known.section == setting.section && known.name == setting.name) {
-                Refuse(file_, line_,
-                       fmt::format("{} is given in line {} already", setting.name, known.line),
-                       "a list has several values: [\"A\", \"B\"]");
-            }
-        }
-        if (IsAt('[')) {
-            AddValues(setting);
-        } else {
-            setting.values.push_back(Value());
-        }
-        settings_.push_back(std::move(setting));
-    }
-
-    void AddValues(FileSetting& setting) {
-        ++at_;
-        while (SkipToNext(true) && !IsAt(']')) {
-            setting.values.push_back(Value());
-            if (SkipToNext(true) && IsAt(',')) {
-                ++at_;
-            } else {
-                break;
-            }
-        }
-        if (!IsAt(']')) {
-            Refuse(file_, setting.line, "the list is not closed", kHint);
-        }
-        ++at_;
-    }
-
-    std::string Value() {
-        if (IsAt('\'') || IsAt('"')) {
-            return QuotedValue(text_[at_++]);
-        }
-        const std::size_t start = at_;
-        at_ = std::min(text_.find_first_of(" \t\r\n#,[]\"'", at_), text_.size());
-        if (at_ == start) {
-            Fail("is no setting");
-        }
-        return std::string(text_.substr(start, at_ - start));
-    }
-
-    // Between quotes of the one kind all stands for itself, between those of the other a backslash
-    // makes the next character do so.
-    std::string QuotedValue(char quote) {
-        std::string value;
-        for (; at_ < text_.size() && text_[at_] != '\n'; ++at_) {
-            char c = text_[at_];
-            if (c == quote) {
-                ++at_;
-                return value;
-            }
-            if (c == '\\' && quote == '"') {
-                ++at_;
-                if (!IsAt('\\') && !IsAt('"')) {
-                    Fail(
-                        "behind a backslash stands neither a backslash nor a quote; between '' "
-                        "backslashes are as they stand");
-                }
-                c = text_[at_];
-            }
-            if (c == '\0') {
-                break;
-            }
-            value += c;
-        }
-        Fail("a quote is not closed");
-    }
-
-    const std::filesystem::path& file_;
-    std::string_view text_;
-    std::size_t at_ = 0;
-    int line_ = 1;
-    std::string section_;
-    std::vector<FileSetting> settings_;
-};
 
 [[noreturn]] void FailToRead(const std::filesystem::path& file, int error) {
     throw Failure(kExitCaller, file,
@@ -356,10 +200,6 @@ private:
 };
 
 }  // namespace
-
-std::vector<FileSetting> SettingsIn(const std::filesystem::path& file, std::string_view text) {
-    return SettingsText(file, text).Read();
-}
 
 std::filesystem::path DefaultSettingsFile() {
     constexpr char kName[] = "cliphost.toml";

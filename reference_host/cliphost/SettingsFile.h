@@ -14,18 +14,6 @@ namespace cliphost {
 // A file with options that a user gives always: those before the first section are the program's,
 // and each verb's stand in a section by its name. The command line wins over it.
 
-struct FileSetting {
-    std::string section;  // empty: before the first
-    std::string name;     // empty: the section begins
-    std::vector<std::string> values;
-    int line = 0;
-};
-
-// What a text in (a part of) TOML says: sections and `name = value`. The reader of the command-line
-// parser passes over what it doesn't understand; this one throws a Failure that names file and
-// line.
-std::vector<FileSetting> SettingsIn(const std::filesystem::path& file, std::string_view text);
-
 // $XDG_CONFIG_HOME/cliphost.toml, or that of ~/.config; empty where neither folder is known.
 std::filesystem::path DefaultSettingsFile();
 

@@ -125,11 +125,15 @@ TEST_F(SettingsFile, MayBeMissing) {
 }
 
 TEST_F(SettingsFile, NamesWhatIsWrong) {
-    ExpectRefused("a\n", "line 1: is no setting");
+    ExpectRefused("a\n", "line 1: Error while parsing key-value pair");
     ExpectRefused("editor-rate = 25\neditor-rate = 30\n",
-                  "line 2: editor-rate is given in line 1 already");
-    ExpectRefused("editor-rate = x\n", "line 1: editor-rate: ");
-    ExpectRefused("editor-rate = \n", "line 1: is no setting");
+                  "line 2: Error while parsing key-value pair: cannot redefine");
+    ExpectRefused("editor-rate = x\n", "line 1: Error while parsing value");
+    ExpectRefused("editor-rate = \n", "line 1: Error while parsing key-value pair");
+    ExpectRefused("editor-rate = 'x'\n", "line 1: editor-rate: ");
+    ExpectRefused("editor-rate = 2026-01-31\n", "line 1: editor-rate: is neither a text, a number");
+    ExpectRefused("[verify]\nmap = [[1]]\n", "line 2: map: is neither");
+    ExpectRefused("[verify]\nmap = \"a\\u0000\"\n", "line 2: map: is neither");
     ExpectRefused("editor-rate = \"\"\n", "line 1: editor-rate: ");
     ExpectRefused("editor-rate = [1, 2]\n", "line 1: editor-rate: ");
     ExpectRefused("jobs = 2\n", "line 1: jobs: there is no such option");
@@ -139,19 +143,20 @@ TEST_F(SettingsFile, NamesWhatIsWrong) {
     ExpectRefused("config = \"x\"\n", "line 1: config: there is no such option");
     ExpectRefused("[describe]\npaths = \"x\"\n", "there is no such option");
     ExpectRefused("[describe]\njobs = 2000\n", "line 2: describe.jobs: ");
-    ExpectRefused("[describe]\njson = perhaps\n", "'perhaps' is neither true nor false");
+    ExpectRefused("[describe]\njson = 'perhaps'\n", "'perhaps' is neither true nor false");
     ExpectRefused("[describe]\njson = true\njsonl = true\n",
                   "describe.json and jsonl exclude each other");
     ExpectRefused("[describe]\nmap = \"x\"\n", "line 2: describe.map: ");
-    ExpectRefused("[describe]\nmap = [\"a=M:\",\n", "line 2: the list is not closed");
-    ExpectRefused("[describe]\nextensions = \"mov\n", "line 2: a quote is not closed");
-    ExpectRefused(std::string("a\0b = 1\n", 8), "line 1: is no setting");
-    ExpectRefused("[describe]\nextensions = mov,mp4\n", "line 2: more stands behind it");
-    ExpectRefused("[describe]\nout-dir = \"M:\\media\"\n", "line 2: behind a backslash");
+    ExpectRefused("[describe]\nmap = [\"a=M:\",\n", "line 2: Error while parsing array");
+    ExpectRefused("[describe]\nextensions = \"mov\n", "line 2: Error while parsing string");
+    ExpectRefused(std::string("a\0b = 1\n", 8), "line 1: Error while parsing key-value pair");
+    ExpectRefused("[describe]\nextensions = mov,mp4\n", "line 2: Error while parsing value");
+    ExpectRefused("[describe]\nout-dir = \"M:\\media\"\n",
+                  "line 2: Error while parsing string: unknown escape");
     ExpectRefused("[nothing]\nx = 1\n", "[nothing] names no verb");
     ExpectRefused("[describe-for-parent]\nquiet = true\n", "names no verb");
     ExpectRefused("[default]\nv = 1\n", "line 1: [default] names no verb");
-    ExpectRefused("[describe.more]\nv = 1\n", "line 1: is no section");
+    ExpectRefused("[describe.more]\nv = 1\n", "line 1: [describe.more]: a section has no other");
     // Names of verbs that don't run are checked as well.
     ExpectRefused("[contact]\ncollumns = 1\n", "line 2: contact.collumns: there is no such option");
 }
