@@ -18,7 +18,7 @@ install(CODE "
 # The program writes its manual pages and completions itself.
 set(help ${PROJECT_BINARY_DIR}/help)
 add_custom_command(OUTPUT ${help}/cliphost.1 COMMAND ${CMAKE_COMMAND} -E rm -rf ${help}
-                   COMMAND cliphost help-files ${help} DEPENDS cliphost
+                   COMMAND cliphost --no-config help-files ${help} DEPENDS cliphost
                    VERBATIM)
 add_custom_target(help_files ALL DEPENDS ${help}/cliphost.1)
 install(DIRECTORY ${help}/ DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 FILES_MATCHING PATTERN "*.1")

@@ -4,6 +4,7 @@
 set -euo pipefail
 package=$(realpath "$1")
 root=$(mktemp -d)
+export XDG_CONFIG_HOME=$root/none
 trap 'rm -rf "$root"' EXIT
 fail() { printf 'check_package: %s\n' "$*" >&2; exit 1; }
 
@@ -29,7 +30,7 @@ for file in usr/share/man/man1/cliphost.1 usr/share/man/man1/cliphost-describe.1
             usr/share/bash-completion/completions/cliphost \
             usr/share/zsh/vendor-completions/_cliphost \
             usr/share/fish/vendor_completions.d/cliphost.fish \
-            usr/share/doc/cliphost/copyright; do
+            usr/share/doc/cliphost/docs/cliphost.toml usr/share/doc/cliphost/copyright; do
   [ -s "$root/$file" ] || fail "$file is missing"
 done
 bash -n "$root/usr/share/bash-completion/completions/cliphost" || fail "bash does not read its completion"

@@ -5,14 +5,18 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <map>
 #include <nlohmann/json.hpp>
 
+#include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -55,6 +59,87 @@ DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
         session.aaf().TryToSave(options.movies.together);
         bin_.emplace(session.aaf());
     }
+}
+
+// Which rows are for which movies is known before anything is read.
+void DescribeRun::Planned(const MoviePlan& plan) {
+    const std::shared_ptr<const MovieColumns>& table = options_.form.columns;
+    const std::filesystem::path& written = options_.form.columnsOut;
+    const bool mayBeMovie = !written.empty() && host::system::NumberOf(written).has_value();
+    std::map<const MovieColumns::Row*, std::string> movies;
+    for (std::size_t i = 0; i < plan.size() && (table || mayBeMovie); ++i) {
+        const MovieStep step = plan[i];
+        if (!step.IsMovie()) {
+            continue;
+        }
+        if (mayBeMovie) {
+            RefuseOutputOntoMovie(written, step.movie);
+        }
+        const MovieColumns::Row* const row = table ? table->Find(step.movie) : nullptr;
+        const auto [first, isNew] = movies.emplace(row, step.movie);
+        if (row != nullptr && !isNew && first->second != step.movie) {
+            throw Failure(kExitCaller, table->file(),
+                          fmt::format("row {}: {} may be {} or {}", row->number, row->movie,
+                                      DisplayPath(std::filesystem::path(first->second)),
+                                      DisplayPath(std::filesystem::path(step.movie))),
+                          "give its path");
+        }
+        rowsUsed_.insert(row);
+    }
+    if (!written.empty()) {
+        OutputFile(written).TryPlace();
+    }
+}
+
+void DescribeRun::TellUnusedRows() const {
+    constexpr std::size_t kMostTold = 20;
+    const MovieColumns& table = *options_.form.columns;
+    std::size_t unused = 0;
+    for (const MovieColumns::Row& row : table.rows()) {
+        if (rowsUsed_.count(&row) == 0 && ++unused <= kMostTold) {
+            Notice("cliphost: {}: row {}: no movie is {}\n", DisplayPath(table.file()), row.number,
+                   row.movie);
+        }
+    }
+    if (unused > kMostTold) {
+        Notice("cliphost: {}: {} more are for none\n", DisplayPath(table.file()),
+               Counted(unused - kMostTold, "row"));
+    }
+}
+
+// The fixed columns, then those of the bin in the order in which they came.
+void DescribeRun::WriteColumns() const {
+    const std::filesystem::path& file = options_.form.columnsOut;
+    if (IsStopped()) {
+        throw Failure(kExitFile, file, "not written: not all movies were read");
+    }
+    std::vector<std::string> header(std::begin(kFixedColumns), std::end(kFixedColumns));
+    std::map<std::string, std::size_t> places;
+    for (const std::string& name : header) {
+        places.emplace(name, places.size());
+    }
+    for (const auto& [movie, values] : columns_) {
+        for (const auto& [name, value] : values) {
+            if (places.emplace(name, header.size()).second) {
+                header.push_back(name);
+            }
+        }
+    }
+    OutputFile out(file);
+    const auto write = [&](const std::vector<std::string>& cells) {
+        const std::string line = CsvLine(cells);
+        out.Write(line.data(), line.size());
+    };
+    write(header);
+    for (const auto& [movie, values] : columns_) {
+        std::vector<std::string> cells(header.size());
+        cells[0] = MachinePath(std::filesystem::absolute(movie).lexically_normal());
+        for (const auto& [name, value] : values) {
+            cells[places[name]] = value;
+        }
+        write(cells);
+    }
+    out.Finish();
 }
 
 MovieAnswer DescribeRun::Answer(const MovieStep& step, const PlaceOfFile& place) {
@@ -126,6 +211,9 @@ void DescribeRun::ShowDone(const std::filesystem::path& movie, const std::filesy
 void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& answer,
                        const std::filesystem::path& saved) {
     maps_.AddUsed(answer.mapsUsed);
+    if (!options_.form.columnsOut.empty()) {
+        columns_.emplace_back(movie.native(), answer.columns);
+    }
     if (host::system::IsStandardOutput(saved)) {
         return;
     }
@@ -161,6 +249,16 @@ void DescribeRun::Finish(int described, int failed) {
             AddProblem(failure.problem(), head);
             AddEntry(head, "");
         }
+    }
+    if (!options_.form.columnsOut.empty()) {
+        try {
+            WriteColumns();
+        } catch (const Failure& failure) {
+            TellAlso(failure);
+        }
+    }
+    if (options_.form.columns && options_.movies.shard.IsWhole()) {
+        TellUnusedRows();
     }
     // Movies of which nothing is known here may be those that a rule is for.
     if (doneBefore() == 0 && !IsStopped() && options_.movies.shard.IsWhole() && described > 0) {

@@ -4,6 +4,7 @@
 
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
+#include <set>
 
 #include "reference_host/cliphost/Bin.h"
 #include "reference_host/cliphost/MoviesRun.h"
@@ -31,6 +32,9 @@ private:
     void ShowDone(const std::filesystem::path& movie, const std::filesystem::path& saved) override;
     void Collect(const std::filesystem::path& movie, const std::filesystem::path& file) override;
     void Finish(int described, int failed) override;
+    void Planned(const MoviePlan& plan) override;
+    void TellUnusedRows() const;
+    void WriteColumns() const;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
     void SaveBin();
     void PrintSummary(int described, int failed) const;
@@ -39,7 +43,9 @@ private:
     const DescribeOptions& options_;
     PathMaps maps_;  // to know which were used
     std::optional<Bin> bin_;
-    std::filesystem::path copyOf_;      // what the last movie that went into the bin is a copy of
+    std::filesystem::path copyOf_;  // what the last movie that went into the bin is a copy of
+    std::set<const MovieColumns::Row*> rowsUsed_;
+    std::vector<std::pair<std::filesystem::path::string_type, ColumnValues>> columns_;
     std::vector<std::string> entries_;  // of the JSON list that comes at the end
 };
 

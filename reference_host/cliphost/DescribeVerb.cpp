@@ -25,10 +25,22 @@ void AddForm(CLI::App& verb, DescriptionForm& form, std::string& pinned) {
     verb.add_option("--pin-time", pinned,
                     "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
                     "same movie gives the same bytes");
+    verb.add_option("--columns", form.columnsFile,
+                    "A table (CSV) with a row for each movie, told by its columns path or name: "
+                    "name, reel, start timecode, and any column of a bin, to be written into the "
+                    "descriptions");
+    verb.add_option("--columns-out", form.columnsOut,
+                    "Write such a table of all movies here, with what their descriptions tell");
     AddMapOption(verb, form.maps,
                  "FROM=TO, for another machine that reads what is saved: locators of movies in the "
                  "folder FROM name TO instead, which is a folder, a drive (M:) or a share "
                  "(//server/share); may be given several times, and the longest FROM counts");
+}
+
+void ReadColumns(DescriptionForm& form) {
+    if (!form.columnsFile.empty()) {
+        form.columns = std::make_shared<const MovieColumns>(form.columnsFile);
+    }
 }
 
 SessionOptions WithTime(const SessionOptions& session, const std::string& pinned) {
@@ -45,6 +57,7 @@ void AddDescribeForParent(CLI::App& app, const SessionOptions& session, int& sta
     AddForm(*verb, *form, *pinned);
     verb->callback([&session, &status, worker, form, pinned] {
         form->json = form->json || form->lines;
+        ReadColumns(*form);
         Session running(WithTime(session, *pinned));
         ServeMovies(running, *worker,
                     [&](const std::filesystem::path& movie, const PlaceOfFile& place) {
@@ -64,6 +77,8 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost describe clip.mov --aaf clip.aaf\n"
         "  cliphost describe FOLDER --out-dir DIR --map /mnt/media=//server/media\n"
         "  cliphost describe FOLDER --bin BIN.aaf --stringout\n"
+        "  cliphost describe FOLDER --columns-out LIST.csv -q   # fill it in, and then:\n"
+        "  cliphost describe FOLDER --bin BIN.aaf --columns LIST.csv\n"
         "  cliphost describe FOLDER --out-dir DIR --recursive --extensions mov,mxf\n"
         "  cliphost describe --files-from LIST --out-dir DIR --skip-done --jsonl\n"
         "  cliphost describe --files-from LIST --out-dir DIR --shard 2/16");
@@ -87,6 +102,8 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         ->needs(bin);
     AddForm(*verb, options->form, *pinned);
     AddInputOptions(*verb, options->movies, *aaf);
+    // What was done before is not looked at, so that nothing is known of it.
+    verb->get_option("--columns-out")->excludes("--skip-done");
     AddWorkerOptions(*verb, options->movies.workers);
     AddDescribeForParent(app, session, status);
     verb->callback([&app, verb, &session, &status, options, pinned] {
@@ -107,6 +124,11 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                 throw Failure(kExitCaller, "--bin", "standard output takes the JSON",
                               "name a file");
             }
+            if (options->form.json && host::system::IsStandardOutput(options->form.columnsOut)) {
+                throw Failure(kExitCaller, "--columns-out", "standard output takes the JSON",
+                              "name a file");
+            }
+            ReadColumns(options->form);
             options->editorRate = session.host.editorFrameRate.value_or(options->editorRate);
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));

@@ -32,8 +32,9 @@ bool StartsWith(const std::string& text, std::string_view start) {
 
 // Options that change what is shown, or that name files which count by their content.
 bool ChangesNoOutput(const std::string& argument) {
-    static constexpr std::string_view kNames[] = {"-v",      "-q",       "--quiet",      "--json",
-                                                  "--jsonl", "--plugin", "--aaf-library"};
+    static constexpr std::string_view kNames[] = {
+        "-v",          "-q",           "--quiet", "--json", "--jsonl", "--plugin", "--aaf-library",
+        "--no-config", "--columns-out"};
     return std::any_of(std::begin(kNames), std::end(kNames), [&](std::string_view name) {
         return StartsWith(argument, name) &&
                (argument.size() == name.size() || argument[name.size()] == '=');
@@ -68,15 +69,18 @@ std::string SettingsText(const Session& session, const std::vector<std::string>&
         all += '\n' + DigestTextOfFile(file);
     }
     constexpr std::string_view kMap = "--map=";
-    constexpr std::string_view kDocument = "--set-xml=";
+    constexpr std::string_view kFiles[] = {"--set-xml=", "--columns="};
     for (const std::string& argument : arguments) {
         if (ChangesNoOutput(argument)) {
             continue;
         }
         all += '\0' + argument;
-        if (StartsWith(argument, kDocument)) {
-            all += '\0' + DigestTextOfFile(argument.substr(kDocument.size()));
-        } else if (StartsWith(argument, kMap) && argument[kMap.size()] != '/') {
+        for (const std::string_view option : kFiles) {
+            if (StartsWith(argument, option)) {
+                all += '\0' + DigestTextOfFile(argument.substr(option.size()));
+            }
+        }
+        if (StartsWith(argument, kMap) && argument[kMap.size()] != '/') {
             all += '\0' + std::filesystem::current_path().native();  // FROM may be relative
         }
     }

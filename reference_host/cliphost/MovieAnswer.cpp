@@ -2,18 +2,32 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/MovieAnswer.h"
 
+#include <algorithm>
+
 #include "reference_host/cliphost/AafLocators.h"
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Fields.h"
 #include "reference_host/cliphost/JsonText.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/RouteTaken.h"
+#include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
 namespace {
 
+constexpr std::uint64_t kMostColumns = 10'000;
 constexpr int kLevelOfDescription = 2;  // in the list of all entries
+
+void WriteColumns(Session& session, const Description& description, const MovieColumns& columns) {
+    if (const MovieColumns::Row* const row = columns.Find(description.movie)) {
+        SetColumns(description.file.get(), columns, *row);
+    } else if (session.verbosity() > 0) {
+        Notice("cliphost: {}: {} has no row for it\n", host::DisplayPath(description.movie),
+               host::DisplayPath(columns.file()));
+    }
+}
 
 bool IsRoute(const std::string& text) {
     for (const char* const known : {"", route::kHeader, route::kLibrary, route::kNone}) {
@@ -36,6 +50,12 @@ MovieAnswer AnswerOf(Session& session, const Description& description, const Des
     }
     if (description.doubt) {
         TellProblem(description.doubt, session.verbosity());
+    }
+    if (form.columns) {
+        WriteColumns(session, description, *form.columns);
+    }
+    if (!form.columnsOut.empty()) {
+        answer.columns = ColumnsOf(description.file.get());
     }
     PathMaps maps = form.maps;
     MapLocators(description.file.get(), maps);
@@ -66,8 +86,8 @@ MovieAnswer AnswerOf(Session& session, const Description& description, const Des
 
 std::string ToBytes(const MovieAnswer& answer) {
     const Problem& problem = answer.problem;
-    return FieldWriter()
-        .Add(static_cast<std::uint64_t>(answer.status))
+    FieldWriter writer;
+    writer.Add(static_cast<std::uint64_t>(answer.status))
         .Add(problem.subject.native())
         .Add(problem.reason)
         .Add(problem.hint)
@@ -78,7 +98,11 @@ std::string ToBytes(const MovieAnswer& answer) {
         .Add(answer.description)
         .Add(answer.mapsUsed)
         .Add(std::uint64_t{answer.isPartial})
-        .bytes();
+        .Add(std::uint64_t{answer.columns.size()});
+    for (const auto& [name, value] : answer.columns) {
+        writer.Add(name).Add(value);
+    }
+    return writer.bytes();
 }
 
 bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer& answer) {
@@ -96,8 +120,14 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     answer.mapsUsed = fields.Number();
     const std::uint64_t isPartial = fields.Number();
     answer.isPartial = isPartial != 0;
-    if (!fields.IsWhole() || isPartial > 1 || status > kExitCaller || !IsRoute(answer.route) ||
-        !IsRoute(problem.route) || (status != kExitFine && !problem)) {
+    const std::uint64_t columns = fields.Number();
+    for (std::uint64_t i = 0; i < std::min(columns, kMostColumns); ++i) {
+        std::string name = fields.Text();
+        std::string value = fields.Text();
+        answer.columns.emplace_back(std::move(name), std::move(value));
+    }
+    if (columns > kMostColumns || !fields.IsWhole() || isPartial > 1 || status > kExitCaller ||
+        !IsRoute(answer.route) || !IsRoute(problem.route) || (status != kExitFine && !problem)) {
         return false;
     }
     answer.status = static_cast<int>(status);

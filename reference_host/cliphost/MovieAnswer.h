@@ -4,9 +4,11 @@
 
 #include <filesystem>
 #include <functional>
+#include <memory>
 #include <string>
 #include <string_view>
 
+#include "reference_host/cliphost/ClipColumns.h"
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/PathMaps.h"
@@ -18,7 +20,10 @@ struct DescriptionForm {
     bool json = false;
     bool lines = false;  // JSON of one line for each movie
     bool quiet = false;
-    PathMaps maps;  // of the locators
+    PathMaps maps;                                // of the locators
+    std::filesystem::path columnsFile;            // a table of columns to write; empty: none
+    std::filesystem::path columnsOut;             // where a table of columns goes; empty: nowhere
+    std::shared_ptr<const MovieColumns> columns;  // the first one, read
 };
 
 // What a verb shows of one movie, whichever process read it.
@@ -29,6 +34,7 @@ struct MovieAnswer {
     std::string routeReason;  // empty on the first route
     std::string description;  // text, or JSON indented as part of an entry; empty where not shown
     std::uint64_t mapsUsed = 0;  // as PathMaps counts them
+    ColumnValues columns;        // where they are asked for
     bool isPartial = false;      // what was made is saved, though some of it could not be read
 };
 

@@ -56,6 +56,7 @@ void MoviesRun::TellAlso(const Failure& failure) {
 int MoviesRun::Run() {
     plan_.emplace(session_, options_, ending_);
     RefuseOneForAllOntoMovie();
+    Planned(plan());
     const bool isForWorkers = IsForWorkers();
     std::optional<DelayedSignals> signals;
     if (isForWorkers || plan().size() > 1) {

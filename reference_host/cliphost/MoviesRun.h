@@ -33,6 +33,8 @@ protected:
     MoviesRun(Session& session, const MoviesOptions& options, const char* doing, const char* ending)
         : session_(session), options_(options), doing_(doing), ending_(ending) {}
 
+    // Before anything is read. A Failure ends the run.
+    virtual void Planned(const MoviePlan&) {}
     // Does the work in this process; what it makes is saved where `place` says.
     virtual MovieAnswer Answer(const MovieStep& step, const PlaceOfFile& place) = 0;
     // Reads what a child process answered; false for what is no answer.

@@ -17,6 +17,7 @@
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
+#include "reference_host/cliphost/SettingsFile.h"
 #include "reference_host/cliphost/SettingsOptions.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/quicktime/MovieComponents.h"
@@ -94,7 +95,8 @@ int Run(int argc, char** argv) {
                    "Use this module file instead of the one beside the program");
     app.add_option("--aaf-library", session.aafLibrary, "Use this build of the AAF library");
 
-    app.parse_complete_callback([&session] {
+    app.parse_complete_callback([&] {
+        RefuseUnreadSettings(app);
         if (!session.aafLibrary.empty()) {
             host::system::MakeFoundAs(session.aafLibrary, kAAFLibraryName);
         }
@@ -116,6 +118,7 @@ int Run(int argc, char** argv) {
     AddParams(app, session, status);
     AddPlugin(app, session, status);
     AddHelpFiles(app);
+    AddSettingsFile(app);
     TellExitStatus(app);
 
     RefuseEmptyTexts(app);

@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/WorkerOptions.h"
 
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/SettingsFile.h"
 #include "reference_host/system/ChildProcess.h"
 
 namespace cliphost {
@@ -18,7 +19,7 @@ constexpr std::uint64_t kMostMebibytes = 1u << 24;
 void AppendGiven(const CLI::App& app, const CLI::App& other, std::vector<std::string>& given) {
     for (const CLI::Option* const option : app.get_options()) {
         const std::string name = option->get_name();
-        if (!other.get_option_no_throw(name)) {
+        if (!other.get_option_no_throw(name) || name == "--config" || name == kNoSettingsFile) {
             continue;
         }
         const bool takesValue = option->get_items_expected_max() > 0;
@@ -72,6 +73,8 @@ void TakeWorkerVerb(CLI::App& app, const CLI::App& verb, const std::string& work
                     const SessionOptions& session, WorkerCall& call) {
     call.program = session.program;
     call.verbosity = session.verbosity;
+    // What the settings file gave is given them, too; they need not read it.
+    call.arguments.emplace_back(kNoSettingsFile);
     AppendGiven(app, app, call.arguments);
     call.arguments.push_back(worker);
     AppendGiven(verb, *app.get_subcommand(worker), call.arguments);

@@ -1,0 +1,244 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/SettingsFile.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cerrno>
+#include <cstdlib>
+#include <fstream>
+#include <sstream>
+#include <vector>
+
+#include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/SettingsText.h"
+
+namespace cliphost {
+namespace {
+
+[[noreturn]] void Refuse(const std::filesystem::path& file, int line, const std::string& reason,
+                         const std::string& hint) {
+    throw Failure(kExitCaller, file, fmt::format("line {}: {}", line, reason), hint);
+}
+
+[[noreturn]] void FailToRead(const std::filesystem::path& file, int error) {
+    throw Failure(kExitCaller, file,
+                  "the settings can't be read: " + std::generic_category().message(error),
+                  "--no-config goes without them");
+}
+
+bool IsFlag(const CLI::Option& option) {
+    return option.get_items_expected_max() == 0;
+}
+
+// A setting with the option that it is for.
+struct Setting : FileSetting {
+    CLI::Option* option = nullptr;
+
+    std::string Key() const { return section.empty() ? name : section + '.' + name; }
+};
+
+using Settings = std::vector<Setting>;
+
+bool IsThere(const Settings& settings, const CLI::Option* option) {
+    return std::any_of(settings.begin(), settings.end(),
+                       [&](const Setting& setting) { return setting.option == option; });
+}
+
+class SettingsReader : public CLI::ConfigBase {
+public:
+    explicit SettingsReader(CLI::App& app) : app_(app) {}
+
+    // All is done here; the parser itself is left nothing to do.
+    std::vector<CLI::ConfigItem> from_config(std::istream& stream) const override {
+        if (app_.get_option(kNoSettingsFile)->count() == 0 && !IsHelpAsked()) {
+            const auto file = app_.get_config_ptr()->as<std::string>();
+            Read(file, TextOf(file, stream));
+        }
+        return {};
+    }
+
+private:
+    bool IsHelpAsked() const {
+        std::vector<CLI::App*> apps = app_.get_subcommands();
+        apps.push_back(&app_);
+        return app_.get_option("--version")->count() > 0 ||
+               std::any_of(apps.begin(), apps.end(), [](const CLI::App* app) {
+                   return app->get_help_ptr() && app->get_help_ptr()->count() > 0;
+               });
+    }
+
+    void Read(const std::filesystem::path& file, const std::string& content) const {
+        Settings settings;
+        for (FileSetting& given : SettingsIn(file, content)) {
+            CLI::App& verb = FindVerb(file, given);
+            if (given.name.empty()) {
+                continue;
+            }
+            Setting setting{std::move(given)};
+            setting.option = &FindOption(file, verb, setting);
+            if ((&verb == &app_ || verb.count() > 0) && !setting.values.empty() &&
+                IsForThisCall(setting)) {
+                settings.push_back(std::move(setting));
+            }
+        }
+        DropUnmet(settings);
+        for (const Setting& setting : settings) {
+            Apply(file, setting, settings);
+        }
+    }
+
+    static std::string TextOf(const std::filesystem::path& file, std::istream& stream) {
+        std::ostringstream text;
+        errno = 0;
+        if (stream.peek() != std::istream::traits_type::eof()) {
+            text << stream.rdbuf();
+        }
+        if (errno != 0) {
+            FailToRead(file, errno);
+        }
+        return text.str();
+    }
+
+    CLI::App& FindVerb(const std::filesystem::path& file, const FileSetting& setting) const {
+        if (setting.section.empty()) {
+            return app_;
+        }
+        const auto verbs = app_.get_subcommands([&](const CLI::App* verb) {
+            return verb->get_name() == setting.section && !verb->get_group().empty();
+        });
+        if (verbs.empty()) {
+            Refuse(file, setting.line, fmt::format("[{}] names no verb", setting.section),
+                   "`cliphost --help` lists them");
+        }
+        return *verbs[0];
+    }
+
+    CLI::Option& FindOption(const std::filesystem::path& file, CLI::App& verb,
+                            const Setting& setting) const {
+        const auto find = [&](CLI::App& app) {
+            const char* const dashes = setting.name.size() == 1 ? "-" : "--";
+            CLI::Option* const found = app.get_option_no_throw(dashes + setting.name);
+            return found && found->get_configurable() ? found : nullptr;
+        };
+        CLI::Option* const option = find(verb);
+        if (!option) {
+            Refuse(file, setting.line, setting.Key() + ": there is no such option",
+                   &verb == &app_ ? "`cliphost --help` lists those that stand before the sections"
+                   : find(app_)   ? "it stands before the first section"
+                                : fmt::format("`cliphost {} --help` lists them", setting.section));
+        }
+        return *option;
+    }
+
+    // What the command line says stays, and so does what excludes it there.
+    static bool IsForThisCall(const Setting& setting) {
+        const auto excluding = setting.option->get_excludes();
+        return setting.option->count() == 0 &&
+               std::none_of(excluding.begin(), excluding.end(),
+                            [](const CLI::Option* other) { return other->count() > 0; });
+    }
+
+    // An option may need one that needs another.
+    static void DropUnmet(Settings& settings) {
+        const auto isUnmet = [&](const Setting& setting) {
+            const auto needs = setting.option->get_needs();
+            return std::any_of(needs.begin(), needs.end(), [&](const CLI::Option* needed) {
+                return needed->count() == 0 && !IsThere(settings, needed);
+            });
+        };
+        for (auto unmet = settings.begin(); unmet != settings.end();) {
+            unmet = std::find_if(settings.begin(), settings.end(), isUnmet);
+            if (unmet != settings.end()) {
+                settings.erase(unmet);
+                unmet = settings.begin();
+            }
+        }
+    }
+
+    static void Apply(const std::filesystem::path& file, const Setting& setting,
+                      const Settings& all) {
+        for (const CLI::Option* const other : setting.option->get_excludes()) {
+            if (IsThere(all, other)) {
+                Refuse(file, setting.line,
+                       fmt::format("{} and {} exclude each other", setting.Key(),
+                                   other->get_name().substr(2)),
+                       "leave one out");
+            }
+        }
+        if (IsFlag(*setting.option)) {
+            ApplyFlag(file, setting);
+            return;
+        }
+        try {
+            setting.option->add_result(setting.values);
+            setting.option->run_callback();
+        } catch (const CLI::Error& error) {
+            Refuse(file, setting.line, fmt::format("{}: {}", setting.Key(), error.what()), "");
+        } catch (const Failure& failure) {
+            Refuse(file, setting.line,
+                   fmt::format("{}: {}", setting.Key(), failure.problem().reason),
+                   failure.problem().hint);
+        }
+    }
+
+    // As often as the option would be given; -v counts.
+    static void ApplyFlag(const std::filesystem::path& file, const Setting& setting) {
+        const std::string& value = setting.values[0];
+        const bool isCount = value.size() == 1 && value[0] >= '0' && value[0] <= '9';
+        if (setting.values.size() != 1 || !(value == "true" || value == "false" || isCount)) {
+            Refuse(file, setting.line,
+                   fmt::format("{}: '{}' is neither true nor false", setting.Key(), value), "");
+        }
+        for (int times = isCount ? value[0] - '0' : value == "true" ? 1 : 0; times > 0; --times) {
+            setting.option->add_result("true");
+        }
+    }
+
+    CLI::App& app_;
+};
+
+}  // namespace
+
+std::filesystem::path DefaultSettingsFile() {
+    constexpr char kName[] = "cliphost.toml";
+    const auto folder = [](const char* variable) {
+        const char* const value = std::getenv(variable);
+        const std::filesystem::path path = value ? value : "";
+        return path.is_absolute() ? path : std::filesystem::path();
+    };
+    if (const auto own = folder("XDG_CONFIG_HOME"); !own.empty()) {
+        return own / kName;
+    }
+    const auto home = folder("HOME");
+    return home.empty() ? home : home / ".config" / kName;
+}
+
+void AddSettingsFile(CLI::App& app) {
+    app.set_config(
+        "--config", DefaultSettingsFile().string(),
+        "Read options from this file instead of ~/.config/cliphost.toml; those of the command line "
+        "win over it");
+    app.add_flag(kNoSettingsFile, "Read no such file")->configurable(false);
+    app.config_formatter(std::make_shared<SettingsReader>(app));
+}
+
+void RefuseUnreadSettings(CLI::App& app) {
+    // The parser notes there what it has read.
+    if (app.get_config_ptr()->count() > 0 || app.get_option(kNoSettingsFile)->count() > 0) {
+        return;
+    }
+    const std::filesystem::path file = DefaultSettingsFile();
+    std::error_code error;
+    const auto kind = std::filesystem::status(file, error).type();
+    if (file.empty() || kind == std::filesystem::file_type::not_found) {
+        return;
+    }
+    const int reason = error                                           ? error.value()
+                       : kind == std::filesystem::file_type::directory ? EISDIR
+                                                                       : EACCES;
+    FailToRead(file, reason);
+}
+
+}  // namespace cliphost

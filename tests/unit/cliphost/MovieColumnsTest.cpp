@@ -1,0 +1,117 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/MovieColumns.h"
+
+#include <gtest/gtest.h>
+
+#include "reference_host/cliphost/Failure.h"
+
+using namespace cliphost;
+
+namespace {
+
+std::int64_t Frames(const char* text, unsigned fps) {
+    const auto time = ReadTimecode(text);
+    return time ? FramesOf(*time, fps).value_or(-1) : -2;
+}
+
+std::uint64_t RowOf(const MovieColumns& columns, const char* movie) {
+    const MovieColumns::Row* const row = columns.Find(movie);
+    return row ? row->number : 0;
+}
+
+void ExpectRefused(std::string_view text, const std::string& words) {
+    try {
+        const MovieColumns columns("t.csv", text);
+        ADD_FAILURE() << "taken: " << text;
+    } catch (const Failure& failure) {
+        EXPECT_EQ(failure.status(), kExitCaller);
+        EXPECT_NE(std::string(failure.what()).find(words), std::string::npos) << failure.what();
+    }
+}
+
+TEST(TimecodeText, IsReadInItsForm) {
+    EXPECT_EQ(Frames("01:00:00:00", 25), 90000);
+    EXPECT_EQ(Frames("23:59:59:24", 25), 86400 * 25 - 1);
+    EXPECT_EQ(Frames("01:00:00;00", 30), 107892);
+    EXPECT_EQ(Frames("01:00:00.02", 30), 107894);
+    EXPECT_EQ(Frames("00:00:01:100", 120), 220);
+    for (const char* const wrong :
+         {"", "1:00:00:00", "01:00:00", "24:00:00:00", "00:60:00:00", "00:00:60:00", "00:00:00:0a",
+          "00-00:00:00", "00:00;00:00", "+1:00:00:00", "01:00:00:0000", "01:00:00:00 "}) {
+        EXPECT_EQ(Frames(wrong, 25), -2) << wrong;
+    }
+}
+
+TEST(TimecodeText, IsCountedAtTheRate) {
+    EXPECT_EQ(Frames("00:00:00:25", 25), -1);
+    EXPECT_EQ(Frames("00:00:00;10", 25), -1);  // nothing drops at 25
+    EXPECT_EQ(Frames("00:01:00;00", 30), -1);  // left out
+    EXPECT_EQ(Frames("00:01:00;01", 30), -1);
+    EXPECT_EQ(Frames("00:01:00;02", 30), 1800);
+    EXPECT_EQ(Frames("00:10:00;00", 30), 17982);
+    EXPECT_EQ(Frames("00:01:00;03", 60), -1);
+    EXPECT_EQ(Frames("00:01:00;04", 60), 3600);
+    EXPECT_EQ(Frames("00:00:00:00", 0), -1);
+}
+
+TEST(TimecodeText, GoesBothWays) {
+    for (const unsigned fps : {24u, 25u, 30u, 60u, 120u}) {
+        for (const bool drops : {false, fps % 30 == 0}) {
+            for (std::int64_t frames = 0; frames < 86000 * fps; frames += 997) {
+                const std::string text = TimecodeOf(frames, fps, drops);
+                ASSERT_EQ(Frames(text.c_str(), fps), frames) << text << " at " << fps;
+            }
+        }
+    }
+    EXPECT_EQ(TimecodeOf(90000, 25, true), "01:00:00:00");
+    EXPECT_EQ(TimecodeOf(86400 * 25, 25, false), "00:00:00:00");
+    EXPECT_EQ(TimecodeOf(1, 0, false), "");
+    EXPECT_EQ(TimecodeOf(-1, 25, false), "");
+}
+
+TEST(MovieColumns, FindsByPathThenByName) {
+    const MovieColumns columns("t.csv",
+                               "Path,Scene\n/m/a.mov,1\na.mov,2\nb,3\nb.mov,4\n"
+                               "file:///m/c%20d.mov,5\n./here/e.mov,6\n/m/x/../f.mov,7\n");
+    EXPECT_EQ(RowOf(columns, "/m/a.mov"), 2u);
+    EXPECT_EQ(RowOf(columns, "/other/a.mov"), 3u);
+    EXPECT_EQ(RowOf(columns, "/m/b.mov"), 5u);
+    EXPECT_EQ(RowOf(columns, "/m/b.mxf"), 4u);
+    EXPECT_EQ(RowOf(columns, "/m/c d.mov"), 6u);
+    EXPECT_EQ(RowOf(columns, "here/e.mov"), 7u);
+    EXPECT_EQ(RowOf(columns, "/there/e.mov"), 0u);
+    EXPECT_EQ(RowOf(columns, "/m/f.mov"), 8u);
+    EXPECT_EQ(RowOf(columns, "/m/A.mov"), 0u);
+}
+
+// With a path the name is the clip's; where a row has none, it says which movie.
+TEST(MovieColumns, KnowsWhatColumnsAreFor) {
+    const MovieColumns columns("t.csv",
+                               "path;NAME;Tape;Start TC;codec;Scene;;\n"
+                               "/a.mov;Clip;R1;01:00:00:00;x;;;\n;b.mov;;;;9;;\n");
+    ASSERT_EQ(columns.rows().size(), 2u);
+    const auto& values = columns.rows()[0].values;
+    ASSERT_EQ(values.size(), 3u);
+    EXPECT_EQ(columns.UseOf(values[0]), ColumnUse::Name);
+    EXPECT_EQ(columns.UseOf(values[1]), ColumnUse::Reel);
+    EXPECT_EQ(columns.UseOf(values[2]), ColumnUse::Start);
+    ASSERT_EQ(columns.rows()[1].values.size(), 1u);
+    EXPECT_EQ(columns.NameOf(columns.rows()[1].values[0]), "Scene");
+    EXPECT_EQ(columns.UseOf(columns.rows()[1].values[0]), ColumnUse::Comment);
+    EXPECT_EQ(RowOf(columns, "/z/b.mov"), 3u);
+}
+
+TEST(MovieColumns, RefusesWhatHasTwoMeanings) {
+    ExpectRefused("scene\n1\n", "no column tells which movie a row is for");
+    ExpectRefused("name,Scene,scene\n", "row 1: columns 2 and 3 (scene) are for the same");
+    ExpectRefused("name,reel,Tape\n", "row 1: columns 2 and 3 (Tape) are for the same");
+    ExpectRefused("name,_x\n", "row 1: column _x: names that begin with _");
+    ExpectRefused("name,x\na,1\na,2\n", "rows 2 and 3 are both for a");
+    ExpectRefused("path,x\n/m/a,1\n/m/./a,2\n", "rows 2 and 3 are both for /m/./a");
+    ExpectRefused("path,x\n,1\n", "row 2: it names no movie");
+    ExpectRefused("name,\na,1\n", "row 2: column 2 has no name in the first row");
+    ExpectRefused("name,start\na,1\n", "row 2, column start: '1' is no timecode");
+}
+
+}  // namespace
