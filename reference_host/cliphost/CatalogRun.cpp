@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/GoneMovies.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MovieThumbnail.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Words.h"
@@ -46,9 +47,23 @@ const DescriptionForm& FormOfAnswer() {
     return form;
 }
 
+// A movie is what it is without its picture, too.
+void TakeThumbnail(Session& session, const std::filesystem::path& movie, catalog::Entry& entry) {
+    try {
+        if (const std::optional<Picture> picture = ThumbnailOf(session, movie)) {
+            AddThumbnail(*picture, entry);
+        }
+    } catch (const Failure& failure) {
+        Problem problem = failure.problem();
+        problem.reason = "no thumbnail: " + problem.reason;
+        TellProblem(problem, session.verbosity());
+        entry["warnings"].push_back(WarningRow(problem, "thumbnail", entry["warnings"].size()));
+    }
+}
+
 }  // namespace
 
-MovieAnswer CatalogAnswer(Session& session, CodecReader& codecs, const CatalogForm&,
+MovieAnswer CatalogAnswer(Session& session, CodecReader& codecs, const CatalogForm& form,
                           const Description& description) {
     MovieAnswer answer;
     answer.problem = description.file ? description.doubt : description.problem;
@@ -60,7 +75,11 @@ MovieAnswer CatalogAnswer(Session& session, CodecReader& codecs, const CatalogFo
         TellProblem(description.doubt, session.verbosity());
     }
     TellRoute(description.movie, session.verbosity());
-    answer.description = ToJson(EntryOf(description, codecs));
+    catalog::Entry entry = EntryOf(description, codecs);
+    if (form.thumbnails) {
+        TakeThumbnail(session, description.movie, entry);
+    }
+    answer.description = ToJson(entry);
     return answer;
 }
 

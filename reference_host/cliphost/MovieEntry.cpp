@@ -3,12 +3,14 @@
 #include "reference_host/cliphost/MovieEntry.h"
 
 #include <algorithm>
+#include <charconv>
 #include <nlohmann/json.hpp>
 #include <optional>
 #include <string_view>
 
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/JsonText.h"
+#include "reference_host/cliphost/PngFile.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/TimecodeText.h"
@@ -188,7 +190,7 @@ void AddColumns(const TreeNode& mob, Entry& entry) {
 
 // What a table needs of each row that a process sent. The first column is its number.
 struct Needed {
-    const char* table;
+    std::string_view table;
     std::vector<const char*> columns;
 };
 const Needed kNeeded[] = {
@@ -197,7 +199,51 @@ const Needed kNeeded[] = {
     {"descriptors", {"number", "class", "properties"}},
     {"columns", {"place", "name", "value"}},
     {"warnings", {"place", "kind", "reason"}},
+    {"thumbnails", {"type", "width", "height", "picture"}},
 };
+constexpr char kThumbnails[] = "thumbnails";
+constexpr char kPicture[] = "picture";
+constexpr char kDigits[] = "0123456789abcdef";
+
+// Bytes travel as digits, since JSON has texts alone.
+std::string DigitsOf(const std::vector<unsigned char>& bytes) {
+    std::string digits;
+    digits.reserve(2 * bytes.size());
+    for (const unsigned char byte : bytes) {
+        digits += kDigits[byte >> 4];
+        digits += kDigits[byte & 15];
+    }
+    return digits;
+}
+
+// Nothing where other characters are in it.
+std::string BytesOf(std::string_view digits) {
+    std::string bytes;
+    bytes.reserve(digits.size() / 2);
+    for (std::size_t at = 0; at + 1 < digits.size(); at += 2) {
+        unsigned byte = 0;
+        const char* const end = digits.data() + at + 2;
+        if (std::from_chars(digits.data() + at, end, byte, 16).ptr != end) {
+            return {};
+        }
+        bytes += static_cast<char>(byte);
+    }
+    return bytes;
+}
+
+// Whole rows of what can be kept: one picture, as bytes.
+void TakeThumbnail(Entry& entry) {
+    const auto rows = entry.find(kThumbnails);
+    if (rows == entry.end() || rows->second.empty()) {
+        return;
+    }
+    rows->second.resize(1);
+    std::string& picture = rows->second.front()[kPicture];
+    picture = BytesOf(picture);
+    if (picture.empty()) {
+        entry.erase(rows);
+    }
+}
 
 }  // namespace
 
@@ -240,6 +286,13 @@ Row WarningRow(const Problem& problem, const char* kind, std::size_t place) {
     return row;
 }
 
+void AddThumbnail(const Picture& picture, Entry& entry) {
+    entry[kThumbnails] = {{{"type", "image/png"},
+                           {"width", std::to_string(picture.width)},
+                           {"height", std::to_string(picture.height)},
+                           {kPicture, DigitsOf(ToPng(picture))}}};
+}
+
 std::string ToJson(const Entry& entry) {
     std::string json;
     for (const auto& [table, rows] : entry) {
@@ -267,11 +320,12 @@ Entry EntryFrom(const std::string& json) {
     const nlohmann::json parsed = nlohmann::json::parse(json, nullptr, false);
     Entry entry;
     for (const Needed& needed : kNeeded) {
-        if (!parsed.is_object() || !parsed.contains(needed.table)) {
+        const std::string table(needed.table);
+        if (!parsed.is_object() || !parsed.contains(table)) {
             continue;
         }
-        std::vector<Row>& rows = entry[needed.table];
-        for (const nlohmann::json& given : parsed[needed.table]) {
+        std::vector<Row>& rows = entry[table];
+        for (const nlohmann::json& given : parsed[table]) {
             Row row;
             for (const char* const column : needed.columns) {
                 row[column];
@@ -283,13 +337,14 @@ Entry EntryFrom(const std::string& json) {
                     }
                 }
             }
-            if (!needed.columns.empty()) {
+            if (!needed.columns.empty() && needed.table != kThumbnails) {
                 row[needed.columns.front()] = std::to_string(rows.size());
             }
             rows.push_back(std::move(row));
         }
     }
     entry["movies"].resize(1);
+    TakeThumbnail(entry);
     return entry;
 }
 

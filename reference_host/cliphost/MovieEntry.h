@@ -7,12 +7,16 @@
 #include "reference_host/catalog/Catalog.h"
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/MovieCodecs.h"
+#include "reference_host/cliphost/Picture.h"
 
 namespace cliphost {
 
 // What a catalog keeps of a movie that is described. What it keeps of every file, such as its size,
 // is not in it.
 catalog::Entry EntryOf(const Description& description, CodecReader& codecs);
+
+// Adds a small picture, as PNG.
+void AddThumbnail(const Picture& picture, catalog::Entry& entry);
 
 // From one process to another, as JSON of objects, lists and texts.
 std::string ToJson(const catalog::Entry& entry);
