@@ -1,0 +1,19 @@
+#!/usr/bin/env bash
+# Copyright (c) 2026 The Cliphost authors
+# SPDX-License-Identifier: MIT
+#
+# describe_ssh.sh HOSTS SHARES MOVIES OUT [OPTION ...]
+# The same as describe.sbatch, on machines that ssh reaches: HOSTS is a file with a line for each, such
+# as 2/user@host for two shares at a time, and : for this machine. Needs GNU parallel here alone.
+# The same call again does what is left.
+set -euo pipefail
+(($# >= 4)) || { sed -n '5s/# /usage: /p' "$0" >&2; exit 2; }
+hosts=$1 shares=$2 movies=$3 out=$4
+shift 4
+mkdir -p "$out"
+
+# A share that fails, or whose machine goes away, is tried on another one.
+seq "$shares" | parallel --quote --sshloginfile "$hosts" --retries 3 --line-buffer --tagstring 'share {}' \
+  --joblog "$out/shares.log" \
+  "${CLIPHOST:-cliphost}" describe "$movies" --recursive --shard "{}/$shares" \
+  --out-dir "$out/{}" --skip-done --jobs 1 --quiet "$@"
