@@ -46,8 +46,10 @@ def main(one, out, movies, shares):
     done = [movie for folder in folders for movie in described(folder)]
     if len(set(done)) != count:
         faults.append(f"the records tell of {len(set(done))} movies of {count}")
-    left = [file for file in out.rglob("*") if file.is_file() and file.suffix not in (".aaf", ".jsonl")]
-    faults += [f"{file} is left over" for file in left]
+    files = [file for file in out.rglob("*") if file.is_file()]
+    parts = [file for file in files if file.suffix == ".part"]  # what a killed run was writing
+    known = (".aaf", ".jsonl", ".part", ".log")
+    faults += [f"{file} is left over" for file in files if file.suffix not in known]
     for fault in faults:
         print(fault)
     again = len(done) - len(set(done))
@@ -55,7 +57,8 @@ def main(one, out, movies, shares):
         f"{count} movies have {len(found)} outputs in {shares} shares; "
         + ("they are those of the single run" if not faults else f"{len(faults)} faults")
     )
-    print(f"done again: {again} of {count} movies")
+    print(f"done again: {again} of {count} movies, and those that a run was at when it ended; "
+          f"unfinished files of a killed run: {len(parts)}")
     return 1 if faults else 0
 
 

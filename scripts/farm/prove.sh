@@ -13,6 +13,8 @@ shares=16 nodes=(farm1 farm2 farm3 farm4)
 pinned=(--pin-time 2026-01-31T12:00:00Z)
 fail() { printf 'farm: %s\n' "$*" >&2; exit 1; }
 say() { printf '%s\n' "$*"; }
+begin() { begun=$(date +%s%N); }
+since_begin() { awk -v a="$begun" -v b="$(date +%s%N)" 'BEGIN { printf "%.1f", (b - a) / 1e9 }'; }
 
 # Slurm takes no blanks in paths, and a socket's path may not be long.
 short=$(mktemp -d /tmp/cliphost-farm.XXXXXX)
@@ -33,14 +35,14 @@ cd "$farm"
 
 "$here/make_movies.py" "$movies" movies
 say "$movies movies are made"
-started=$(date +%s.%N)
+begin
 "$build/cliphost" describe "$farm/movies" --recursive --out-dir one --skip-done --jobs 1 --quiet \
   "${pinned[@]}" >log/one
-say "one process describes them in $(awk -v a="$started" -v b="$(date +%s.%N)" 'BEGIN { printf "%.1f", b - a }') s"
+say "one process describes them in $(since_begin) s"
 
 start_slurm "$farm/slurm" "${nodes[@]}" || fail "Slurm does not start"
 export CLIPHOST=$build/cliphost
-started=$(date +%s.%N)
+begin
 job=$(sbatch --parsable --array="1-$shares" --output="$farm/log/%a" "$here/describe.sbatch" \
   "$shares" "$farm/movies" "$farm/out" "${pinned[@]}")
 say "Slurm has ${#nodes[@]} nodes, and $shares tasks to do"
@@ -67,7 +69,8 @@ killed='' put_back=''
 interrupt() {
   local task process
   for task in $(squeue --noheader --states=R --format=%K); do
-    [ "$task" != "$killed" ] && process=$(process_at_work "$task") || continue
+    [ "$task" != "$killed" ] || continue
+    process=$(process_at_work "$task") || continue
     if [ -z "$killed" ]; then
       kill -KILL "$process" || continue
       killed=$task
@@ -83,17 +86,21 @@ interrupt() {
 }
 until_true 120 interrupt || fail "no two tasks could be interrupted at work; take more movies"
 
-is_through() { [ -z "$(squeue --noheader --job="$job" 2>/dev/null)" ]; }
 all_ended() { ! states | grep -qvE 'COMPLETED|FAILED|CANCELLED|TIMEOUT|NODE_FAIL'; }
 until_true 600 all_ended || fail "the tasks don't end: $(states | sort | uniq -c)"
-say "the tasks are through after $(awk -v a="$started" -v b="$(date +%s.%N)" 'BEGIN { printf "%.1f", b - a }') s: $(
-  cat log/[0-9]* | sed -n 's/^start .* on //p' | sort | uniq -c | awk '{ printf "%s%s %d", sep, $2, $1; sep = ", " }') starts"
+say "the tasks are through after $(since_begin) s; starts by node: $(sed -n 's/^start .* on //p' log/[0-9]* \
+  | sort | uniq -c | awk '{ printf "%s%s %d", sep, $2, $1; sep = ", " }')"
 [ "$(states | sort -u)" = COMPLETED ] || fail "not all tasks are well: $(states | sort | uniq -c)"
 for task in "$killed" "$put_back"; do
   grep -q '^start 2 ' "log/$task" || fail "task $task was not started again"
 done
-for task in $(grep -l " on $drained\$" log/[0-9]* | sed 's|log/||'); do
+while read -r task; do
   grep -qx "$task" <<<"$last_there" || fail "task $task was started on $drained after it was drained"
-done
+done < <(grep -l " on $drained\$" log/[0-9]* | sed 's|log/||')
 
-"$here/compare.py" one out movies "$shares"
+"$here/compare.py" one out movies "$shares" || fail "the outputs are not those of the single run"
+
+printf '2/:\n' >hosts
+"$here/describe_ssh.sh" hosts 4 "$farm/movies" "$farm/out-ssh" "${pinned[@]}" >log/ssh
+say "GNU parallel, 4 shares:"
+"$here/compare.py" one out-ssh movies 4 || fail "the outputs are not those of the single run"

@@ -8,11 +8,11 @@
 
 slurm_daemons=()
 
-# daemon NAME COMMAND ...: in the foreground of its own shell, so that its process is known.
+# daemon NAME COMMAND ...: COMMAND stays in its process, which is known so; Ctrl-C is for others.
 daemon() {
   local log=$slurm/$1.out
   shift
-  "$@" >"$log" 2>&1 </dev/null &
+  setsid "$@" >"$log" 2>&1 </dev/null 9>&- &
   slurm_daemons+=($!)
 }
 
@@ -46,6 +46,8 @@ start_munge() {
     --key-file="$folder/key" --log-file="$folder/log" --pid-file="$folder/pid" --seed-file="$folder/seed"
   until_true 20 test -S "$folder/socket"
 }
+
+are_idle() { [ "$(sinfo --noheader --states=idle --format=%D 2>/dev/null)" = "$1" ]; }
 
 start_slurm() {
   slurm=$1
@@ -92,8 +94,7 @@ CONF
     mkdir -p "$slurm/spool-$node"
     daemon "slurmd-$node" /usr/sbin/slurmd -D -N "$node"
   done
-  # shellcheck disable=SC2016
-  until_true 60 bash -c '[ "$(sinfo --noheader --states=idle --format=%D 2>/dev/null)" = "$1" ]' - $# \
+  until_true 60 are_idle $# \
     || { tail -n 5 "$slurm"/*.out >&2; return 1; }
 }
 
@@ -102,12 +103,14 @@ slurm_processes() {
   env -u SLURM_CONF grep -lsxzF "SLURM_CONF=$SLURM_CONF" /proc/[0-9]*/environ | cut -d/ -f3
 }
 
+has_no_job() { [ -z "$(timeout 5 squeue --noheader 2>/dev/null)" ]; }
+
 # Ends everything that start_slurm and the jobs started.
 stop_slurm() {
   local left
   ((${#slurm_daemons[@]})) || return 0
   timeout 10 scancel --quiet --full --user="$(id -un)" 2>/dev/null
-  until_true 10 bash -c '[ -z "$(timeout 5 squeue --noheader 2>/dev/null)" ]'
+  until_true 10 has_no_job
   # The key's keeper goes last, since the others talk by it.
   kill "${slurm_daemons[@]:1}" 2>/dev/null
   wait "${slurm_daemons[@]:1}" 2>/dev/null
