@@ -50,13 +50,6 @@ std::string DigestTextOfFile(const std::filesystem::path& file) {
     throw Failure(kExitCaller, std::move(problem));
 }
 
-// The same path for all runs, wherever they are started.
-std::string KeptPath(const std::filesystem::path& movie) {
-    std::error_code error;
-    const std::filesystem::path absolute = std::filesystem::absolute(movie, error);
-    return MachinePath((error ? movie : absolute).lexically_normal());
-}
-
 }  // namespace
 
 std::string SettingsText(const Session& session, const std::vector<std::string>& arguments) {
@@ -141,7 +134,7 @@ void DoneMovies::LoadLine(const std::string& line) {
 bool DoneMovies::Has(const std::filesystem::path& movie, const FileState& state,
                      const std::filesystem::path& output) const {
     const auto [first, last] =
-        outputs_.equal_range(KeyOf(KeptPath(movie), PercentEncoded(output.native())));
+        outputs_.equal_range(KeyOf(AbsoluteMachinePath(movie), PercentEncoded(output.native())));
     if (first == last) {
         return false;
     }
@@ -187,9 +180,12 @@ void DoneMovies::Add(const std::filesystem::path& movie, const FileState& state,
     if (!there) {
         return;  // it was taken away already
     }
-    ordered_json line = {{"movie", KeptPath(movie)},  {"size", state.size},
-                         {"date", state.date},        {"output", PercentEncoded(output.native())},
-                         {"outputSize", there->size}, {"outputDate", there->date}};
+    ordered_json line = {{"movie", AbsoluteMachinePath(movie)},
+                         {"size", state.size},
+                         {"date", state.date},
+                         {"output", PercentEncoded(output.native())},
+                         {"outputSize", there->size},
+                         {"outputDate", there->date}};
     if (known == Known::ByContent) {
         line["outputDigest"] = DigestTextOfFile(file);
     }

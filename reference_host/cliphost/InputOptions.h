@@ -13,6 +13,9 @@ namespace cliphost {
 // has --out-dir.
 void AddInputOptions(CLI::App& verb, MoviesOptions& movies, CLI::Option& file);
 
+// The same for a verb that makes one thing of all movies. Gives the option for a list.
+CLI::Option* AddInputOptions(CLI::App& verb, MoviesOptions& movies);
+
 // Refuses a call that names no movie. Throws a problem of the command line.
 void NeedInputs(const MoviesOptions& movies);
 

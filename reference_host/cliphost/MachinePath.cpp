@@ -18,4 +18,15 @@ std::string MachinePath(const std::filesystem::path& path) {
     return host::text::FileUrl(error ? bytes : absolute.native());
 }
 
+std::string AbsoluteMachinePath(const std::filesystem::path& path) {
+    std::error_code error;
+    const std::filesystem::path absolute = std::filesystem::absolute(path, error);
+    return MachinePath((error ? path : absolute).lexically_normal());
+}
+
+std::filesystem::path PathOfMachinePath(const std::string& text) {
+    std::string path;
+    return host::text::IsFileUrl(text) && host::text::PathOfFileUrl(text, path) ? path : text;
+}
+
 }  // namespace cliphost

@@ -12,6 +12,11 @@ namespace cliphost {
 // both forms.
 std::string MachinePath(const std::filesystem::path& path);
 
+// The same of the absolute path: equal for all runs, wherever they are started.
+std::string AbsoluteMachinePath(const std::filesystem::path& path);
+// The path that a machine path stands for.
+std::filesystem::path PathOfMachinePath(const std::string& text);
+
 // What to say of it where --json is explained.
 inline constexpr char kJsonHelp[] =
     "As JSON; a path that is not UTF-8 is given as a file URL (file:///a%FF.mov), which every "

@@ -43,11 +43,15 @@ public:
         if (!std::filesystem::is_directory(path, ignored)) {
             AppendMovie(path, path, MoviePlan::kNamed,
                         [&] { return Keep(path.native(), plan_.named_); });
-        } else if (options_.isRecursive) {
+            return;
+        }
+        hasMovies_ = false;
+        if (options_.isRecursive) {
             AddTree(path);
         } else {
             AddFolder(path, false);
         }
+        plan_.givenFolders_.push_back({path, hasMovies_});
     }
 
 private:
@@ -65,6 +69,7 @@ private:
     void AppendMovie(const std::filesystem::path& movie, const std::filesystem::path& asGiven,
                      std::uint32_t list, const Place& place) {
         isEmpty_ = false;
+        hasMovies_ = true;
         const unsigned number = hasNumbers_ ? NextNumber(movie) : 0;
         if (IsOfShare(asGiven)) {
             plan_.steps_.push_back({list, place()});
@@ -187,6 +192,7 @@ private:
     std::unordered_set<std::string> names_;                  // of outputs
     std::unordered_map<std::string, unsigned> lastNumbers_;  // by the name without one
     bool isEmpty_ = true;  // the folder has neither a movie nor what is told as one
+    bool hasMovies_ = false;
 };
 
 MoviePlan::MoviePlan(Session& session, const MoviesOptions& options, const char* ending) {

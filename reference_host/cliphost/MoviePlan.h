@@ -65,6 +65,14 @@ public:
     // The module's lists end; what they said stays.
     void EndLists();
 
+    // A folder of the command line or the list.
+    struct GivenFolder {
+        std::filesystem::path path;
+        bool hasMovies = false;  // of any share
+    };
+    const std::vector<GivenFolder>& givenFolders() const { return givenFolders_; }
+    bool IsNamed(std::size_t place) const { return steps_[place].list == kNamed; }
+
 private:
     struct Planned {
         std::uint32_t list;   // among the folders, or one of those below
@@ -81,6 +89,7 @@ private:
     PathList named_;
     PathList found_;
     std::vector<MovieStep> others_;
+    std::vector<GivenFolder> givenFolders_;
 };
 
 // The name of what is made of a movie. Movies of one name in different folders have numbers.

@@ -23,6 +23,7 @@ namespace cliphost {
 
 using host::DisplayPath;
 using host::system::DelayedSignals;
+using host::system::FileState;
 
 namespace {
 
@@ -63,6 +64,8 @@ int MoviesRun::Run() {
     std::optional<OutputFolder> folder;
     if (!options_.outFolder.empty()) {
         folder.emplace(options_.outFolder);
+    }
+    if (LooksFirst()) {
         LookAtMovies();
     }
     if (isForWorkers) {
@@ -107,17 +110,24 @@ void MoviesRun::LookAtMovies() {
         }
         Look& look = looks_[i];
         look.state = host::system::StateOf(step.movie);
-        if (doneMovies_ && look.state) {
-            const auto output = OutputName(step.movie, plan().NumberOf(i), ending_);
-            look.isDone = doneMovies_->Has(step.movie, *look.state, output);
-            doneBefore_ += look.isDone ? 1 : 0;
-        }
+        look.isDone = look.state && IsDoneAlready(i, step, *look.state);
+        doneBefore_ += look.isDone ? 1 : 0;
     }
+}
+
+bool MoviesRun::IsDoneAlready(std::size_t place, const MovieStep& step, const FileState& state) {
+    return doneMovies_ && doneMovies_->Has(step.movie, state,
+                                           OutputName(step.movie, plan().NumberOf(place), ending_));
+}
+
+const char* MoviesRun::HowToGoOn() const {
+    return !options_.outFolder.empty() && canRecord_ ? "; the same call with --skip-done goes on"
+                                                     : "";
 }
 
 void MoviesRun::Remember(std::size_t place, const MovieStep& step,
                          const std::filesystem::path& saved) {
-    if (looks_.empty() || !looks_[place].state) {
+    if (options_.outFolder.empty() || !looks_[place].state) {
         return;
     }
     if (options_.skipDone) {
@@ -161,12 +171,11 @@ void MoviesRun::TellStop() {
     for (const auto& [place, output] : outputs_) {
         Record(place, plan()[place], output, DoneMovies::Known::ByDate);
     }
-    const bool goesOn = !options_.outFolder.empty() && canRecord_;
     const int done = done_ + doneBefore_;
     const int all = done + failed_ + Left();
     Notice("cliphost: stopped by signal {}: {} of {} done, {} failed, {} left{}\n",
            DelayedSignals::Which(), done, Counted(static_cast<std::uint64_t>(all), "movie"),
-           failed_, Left(), goesOn ? "; the same call with --skip-done goes on" : "");
+           failed_, Left(), HowToGoOn());
 }
 
 // It is written when all movies were read: none of them may be there.
@@ -184,6 +193,7 @@ void MoviesRun::RunHere() {
     }
     for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
         const MovieStep step = plan()[i];
+        shown_ = i;
         if (progress_) {
             progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
         }
@@ -254,6 +264,7 @@ bool MoviesRun::Take(std::size_t number, const WorkerResult& result) {
     const std::size_t place = placesOfRequests_[number];
     TellThoseBefore(place);
     ++nextPlace_;
+    shown_ = place;
     const MovieStep step = plan()[place];
     progress_->Step(DisplayPath(std::filesystem::path(step.movie).filename()));
     Notice("{}", result.told);
@@ -291,6 +302,7 @@ void MoviesRun::Deliver(std::size_t place, const MovieStep& step, std::size_t nu
 
 void MoviesRun::TellInstead(std::size_t place) {
     const MovieStep step = plan()[place];
+    shown_ = place;
     if (IsDone(place)) {
         if (session_.verbosity() > 0) {
             Notice("cliphost: {}: is done already\n",

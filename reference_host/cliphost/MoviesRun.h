@@ -51,6 +51,18 @@ protected:
                          const std::filesystem::path& /*file*/) {}
     // After all.
     virtual void Finish(int /*done*/, int /*failed*/) {}
+    // Whether a movie need not be read, of which all is known; asked of each before the first is
+    // read, where LooksFirst says so.
+    virtual bool LooksFirst() const { return !options_.outFolder.empty(); }
+    virtual bool IsDoneAlready(std::size_t place, const MovieStep& step,
+                               const host::system::FileState& state);
+    // What is told at a stop of how the work goes on.
+    virtual const char* HowToGoOn() const;
+    // What the movie that is shown was before it was read; none for what is no file.
+    std::optional<host::system::FileState> StateBefore() const {
+        return looks_.empty() ? std::nullopt : looks_[shown_].state;
+    }
+    const MoviePlan& plan() const { return *plan_; }
     // For Finish: how many were left out, and whether a signal stopped the run.
     int doneBefore() const { return doneBefore_; }
     bool IsStopped() const { return isStopped_; }
@@ -89,7 +101,6 @@ private:
     using PlacesByFile = std::map<host::system::FileNumber, std::size_t>;
     const PlacesByFile& Guarded();
     std::filesystem::path TargetFor(std::size_t place, const MovieStep& step);
-    const MoviePlan& plan() const { return *plan_; }
 
     Session& session_;
     const MoviesOptions& options_;
@@ -100,7 +111,8 @@ private:
         std::optional<host::system::FileState> state;  // before the movie was read
         bool isDone = false;                           // its output is there
     };
-    std::vector<Look> looks_;                      // where there is a folder for outputs
+    std::vector<Look> looks_;                      // where LooksFirst says so
+    std::size_t shown_ = 0;                        // the place of the movie at hand
     std::vector<std::uint32_t> placesOfRequests_;  // among the steps
     std::size_t nextPlace_ = 0;
     std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown

@@ -112,6 +112,8 @@ int Run(int argc, char** argv) {
     AddDump(app, session);
     AddVerify(app, session, status);
     AddRelink(app, session, status);
+    AddCatalog(app, session, status);
+    AddFind(app, status);
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);

@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/SheetPictures.h"
 
+#include <algorithm>
+#include <cmath>
+
 #include "reference_host/cliphost/FrameReader.h"
 #include "reference_host/cliphost/PixelsToPicture.h"
 #include "reference_host/quicktime/Thumbnails.h"
@@ -110,6 +113,17 @@ private:
 };
 
 }  // namespace
+
+int ShownHeight(int width, const ClipTrack& track, const SheetPictures& pictures,
+                const PictureTurn& turn) {
+    const aafRational_t& shape = track.shape;
+    const double stored = shape.denominator > 0 && shape.numerator > 0
+                              ? static_cast<double>(shape.denominator) / shape.numerator
+                              : static_cast<double>(pictures.height()) / pictures.width();
+    const double shown = turn.swapsSides ? 1.0 / stored : stored;
+    const double height = width * std::clamp(shown, 0.05, 20.0);
+    return std::max(1, static_cast<int>(std::lround(height)));
+}
 
 std::unique_ptr<SheetPictures> SmallPictures(Essence& essence, const ClipTrack& track,
                                              bool isExact) {

@@ -7,6 +7,7 @@
 
 #include "reference_host/cliphost/Essence.h"
 #include "reference_host/cliphost/Picture.h"
+#include "reference_host/cliphost/PictureTurn.h"
 
 namespace cliphost {
 
@@ -25,6 +26,11 @@ public:
     // May give a picture that has the size of a cell already, and one near to the frame.
     virtual NCFRESULT Read(std::uint64_t frame, Picture& picture) = 0;
 };
+
+// How high a picture of a width is, in the shape in which the clip is shown, whatever its pixels
+// are.
+int ShownHeight(int width, const ClipTrack& track, const SheetPictures& pictures,
+                const PictureTurn& turn);
 
 // Those that the host's own reader makes small while it decodes; `isExact`: each is the frame that
 // was asked for. Null for a movie that it does not open.

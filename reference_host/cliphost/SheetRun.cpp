@@ -4,8 +4,6 @@
 
 #include <fmt/format.h>
 
-#include <cmath>
-
 #include "reference_host/cliphost/ContactSheet.h"
 #include "reference_host/cliphost/FrameRange.h"
 #include "reference_host/cliphost/OutputFile.h"
@@ -16,18 +14,6 @@
 
 namespace cliphost {
 namespace {
-
-// Cells have the shape in which the clip is shown, whatever its pixels are.
-int CellHeight(const SheetForm& form, const ClipTrack& track, const SheetPictures& pictures,
-               const PictureTurn& turn) {
-    const aafRational_t& shape = track.shape;
-    const double stored = shape.denominator > 0 && shape.numerator > 0
-                              ? static_cast<double>(shape.denominator) / shape.numerator
-                              : static_cast<double>(pictures.height()) / pictures.width();
-    const double shown = turn.swapsSides ? 1.0 / stored : stored;
-    const double height = form.width * std::clamp(shown, 0.05, 20.0);
-    return std::max(1, static_cast<int>(std::lround(height)));
-}
 
 // Parameters change the levels of what the module delivers.
 std::unique_ptr<SheetPictures> PicturesFor(Essence& essence, const ClipTrack& track,
@@ -51,7 +37,7 @@ MovieAnswer MakeSheet(Session& session, const std::filesystem::path& movie, cons
         throw Failure(kExitFile, movie, "its pictures have no size");
     }
     const PictureTurn turn = form.turn.TurnFor(movie);
-    const int cellHeight = CellHeight(form, track, *pictures, turn);
+    const int cellHeight = ShownHeight(form.width, track, *pictures, turn);
     ContactSheet sheet(static_cast<int>(frames.size()), form.columns, form.width, cellHeight);
     pictures->Prepare(turn.swapsSides ? cellHeight : form.width,
                       turn.swapsSides ? form.width : cellHeight, frames.size());

@@ -1,0 +1,83 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/CatalogFile.h"
+
+#include <fmt/format.h>
+
+#include <cerrno>
+
+#include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/OutputProblem.h"
+
+namespace cliphost {
+namespace {
+
+using catalog::Catalog;
+using catalog::DatabaseError;
+
+// Whether a catalog is there that may be replaced. Throws a Failure for anything else.
+bool IsThere(const std::filesystem::path& file) {
+    if (OutputFile::IsDevice(file)) {
+        throw Failure(kExitCaller, file, "a catalog has to be a file", "name one");
+    }
+    std::error_code ignored;
+    if (std::filesystem::is_directory(file, ignored)) {
+        throw Failure(kExitCaller, NotWritten(file, EISDIR));
+    }
+    return WithCatalog(file, [&] { return catalog::IsCatalog(file); });
+}
+
+}  // namespace
+
+Failure CatalogFailure(const std::filesystem::path& file, const DatabaseError& error) {
+    if (error.IsNoDatabase()) {
+        return {kExitCaller, file, "is no SQLite file, so it is no catalog"};
+    }
+    if (error.IsLocked()) {
+        return {kExitCaller, file,
+                fmt::format("another program has kept it locked for {} seconds",
+                            catalog::Database::kPatience / 1000),
+                "try again when that is done"};
+    }
+    if (error.IsDamaged()) {
+        return {kExitCaller, file, fmt::format("the catalog is damaged: {}", error.what()),
+                "make it anew, without --update"};
+    }
+    if (error.IsFull()) {
+        return {kExitCaller, NotWritten(file, ENOSPC)};
+    }
+    if (error.IsReadOnly()) {
+        return {kExitCaller, NotWritten(file, EACCES)};
+    }
+    if (error.CantOpen()) {
+        if (Problem problem = WhyUnreadable(file)) {
+            return {kExitCaller, std::move(problem)};
+        }
+    }
+    return {kExitCaller, file, fmt::format("the database library says: {}", error.what())};
+}
+
+Failure CatalogFailure(const std::filesystem::path& file, const catalog::NoCatalog& error) {
+    return {kExitCaller, file, error.what()};
+}
+
+Catalog OpenCatalog(const std::filesystem::path& file, Catalog::For what) {
+    if (Problem problem = WhyUnreadable(file)) {
+        throw Failure(kExitCaller, std::move(problem));
+    }
+    return WithCatalog(file, [&] { return Catalog(file, what); });
+}
+
+NewCatalog::NewCatalog(const std::filesystem::path& file)
+    : file_(file), takesPlace_(IsThere(file)), output_(file, OutputFile::Writer::Other) {
+    // What the system says of the place is plainer than what the library does.
+    output_.TryPlace();
+    WithCatalog(file_, [&] { catalog_.emplace(output_.NameForOther(), Catalog::For::Making); });
+}
+
+void NewCatalog::Finish() {
+    catalog_.reset();
+    output_.Finish();
+}
+
+}  // namespace cliphost

@@ -1,0 +1,216 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/CatalogRun.h"
+
+#include <fmt/format.h>
+
+#include "reference_host/cliphost/Describe.h"
+#include "reference_host/cliphost/Digest.h"
+#include "reference_host/cliphost/GoneMovies.h"
+#include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MovieThumbnail.h"
+#include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/RouteTaken.h"
+#include "reference_host/cliphost/Words.h"
+#include "reference_host/framework/HostPath.h"
+
+namespace cliphost {
+namespace {
+
+using catalog::Catalog;
+
+// So many movies, or those of so long, are lost at most where a program is killed that updates.
+constexpr std::size_t kMostWaiting = 256;
+constexpr std::chrono::seconds kLongestWait{2};
+
+// It comes from the path alone, so that every run and every share gives a movie the same.
+std::string NumberOfMovie(const std::string& path) {
+    const Digest digest = DigestOf(path);
+    std::uint64_t number = 0;
+    for (std::size_t i = 0; i < sizeof number; ++i) {
+        number = number << 8 | digest[i];
+    }
+    return std::to_string(number >> 1);  // SQLite's have 63 bits above nought
+}
+
+std::string Now() {
+    const auto now = std::chrono::system_clock::now().time_since_epoch();
+    return std::to_string(std::chrono::nanoseconds(now).count());
+}
+
+const DescriptionForm& FormOfAnswer() {
+    static const DescriptionForm form = [] {
+        DescriptionForm json;
+        json.json = true;
+        return json;
+    }();
+    return form;
+}
+
+// A movie is what it is without its picture, too.
+void TakeThumbnail(Session& session, const std::filesystem::path& movie, catalog::Entry& entry) {
+    try {
+        if (const std::optional<Picture> picture = ThumbnailOf(session, movie)) {
+            AddThumbnail(*picture, entry);
+        }
+    } catch (const Failure& failure) {
+        Problem problem = failure.problem();
+        problem.reason = "no thumbnail: " + problem.reason;
+        TellProblem(problem, session.verbosity());
+        entry["warnings"].push_back(WarningRow(problem, "thumbnail", entry["warnings"].size()));
+    }
+}
+
+}  // namespace
+
+MovieAnswer CatalogAnswer(Session& session, CodecReader& codecs, const CatalogForm& form,
+                          const Description& description) {
+    MovieAnswer answer;
+    answer.problem = description.file ? description.doubt : description.problem;
+    if (!description.file) {
+        answer.status = StatusOf(description.problem);
+        return answer;
+    }
+    if (description.doubt) {
+        TellProblem(description.doubt, session.verbosity());
+    }
+    TellRoute(description.movie, session.verbosity());
+    catalog::Entry entry = EntryOf(description, codecs);
+    if (form.thumbnails) {
+        TakeThumbnail(session, description.movie, entry);
+    }
+    answer.description = ToJson(entry);
+    return answer;
+}
+
+CatalogRun::CatalogRun(Session& session, const CatalogOptions& options)
+    : MoviesRun(session, options.movies, "cataloguing", ".sqlite"),
+      options_(options),
+      settings_(SettingsText(session, options.movies.workers.arguments)),
+      codecs_(session) {
+    const std::filesystem::path& file = options.movies.together;
+    std::error_code ignored;
+    if (options.update && std::filesystem::exists(file, ignored)) {
+        updated_.emplace(OpenCatalog(file, Catalog::For::Changing));
+        return;
+    }
+    made_.emplace(file);
+    if (options.update) {
+        made_->Finish();
+        made_.reset();
+        updated_.emplace(OpenCatalog(file, Catalog::For::Changing));
+    }
+}
+
+Catalog& CatalogRun::catalog() {
+    return made_ ? made_->catalog() : *updated_;
+}
+
+MovieAnswer CatalogRun::Answer(const MovieStep& step, const PlaceOfFile&) {
+    const Description description =
+        step.folder ? DescribeFromList(session(), step.folder->list(), step.index, step.movie)
+                    : DescribeMovie(session(), step.movie);
+    return CatalogAnswer(session(), codecs_, options_.form, description);
+}
+
+bool CatalogRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
+    return FromBytes(bytes, FormOfAnswer(), answer);
+}
+
+void CatalogRun::Show(const std::filesystem::path& movie, const MovieAnswer& answer,
+                      const std::filesystem::path&) {
+    Add(movie, EntryFrom(answer.description), false);
+}
+
+void CatalogRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    catalog::Entry entry;
+    catalog::Row& row = entry["movies"].emplace_back();
+    if (!problem.route.empty()) {
+        row["route"] = problem.route;
+    }
+    entry["warnings"].push_back(WarningRow(problem, "failure", 0));
+    Add(movie, std::move(entry), true);
+}
+
+void CatalogRun::Add(const std::filesystem::path& movie, catalog::Entry entry, bool hasFailed) {
+    const auto state = StateBefore();
+    if (!state) {
+        return;  // nothing is there
+    }
+    catalog::Row& row = entry["movies"].front();
+    const std::string path = AbsoluteMachinePath(movie);
+    row["id"] = NumberOfMovie(path);
+    row["path"] = path;
+    row.emplace("name", MachinePath(movie.stem()));
+    row["size"] = std::to_string(state->size);
+    row["date"] = std::to_string(state->date);
+    row["looked"] = Now();
+    row["settings"] = settings_;
+    row["failed"] = hasFailed ? "1" : "0";
+    waiting_.push_back(std::move(entry));
+    if (waiting_.size() >= kMostWaiting ||
+        std::chrono::steady_clock::now() - written_ > kLongestWait) {
+        Write();
+    }
+}
+
+// What goes wrong here ends the run: no further movie would fare better.
+void CatalogRun::Write() {
+    catalog().Put(waiting_);
+    waiting_.clear();
+    written_ = std::chrono::steady_clock::now();
+}
+
+bool CatalogRun::IsDoneAlready(std::size_t, const MovieStep& step,
+                               const host::system::FileState& state) {
+    const auto known = updated_
+                           ? updated_->Find(AbsoluteMachinePath(std::filesystem::path(step.movie)))
+                           : std::nullopt;
+    return known && !known->hasFailed && known->size == state.size && known->date == state.date &&
+           known->settings == settings_;
+}
+
+const char* CatalogRun::HowToGoOn() const {
+    return made_ && made_->TakesPlace() ? "; the catalog is left as it was"
+                                        : "; the same call with --update goes on";
+}
+
+std::size_t CatalogRun::RemoveGone() {
+    const std::vector<std::string> gone = GoneMovies(options_.movies, plan(), catalog());
+    for (const std::string& path : gone) {
+        Notice("cliphost: {}: is gone, and is removed from the catalog\n",
+               host::DisplayPath(PathOfMachinePath(path)));
+    }
+    if (!gone.empty()) {
+        catalog().Remove(gone);
+    }
+    return gone.size();
+}
+
+void CatalogRun::Finish(int read, int failed) {
+    Write();
+    const std::size_t gone = updated_ && !IsStopped() ? RemoveGone() : 0;
+    if (made_ && !(IsStopped() && made_->TakesPlace())) {
+        made_->Finish();
+    }
+    std::string summary = fmt::format("{} catalogued, {} not", read, failed);
+    if (updated_) {
+        summary += fmt::format(", {} as before, {} gone", doneBefore(), gone);
+    }
+    fmt::print("{}\n", summary);
+}
+
+void MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
+                   const std::filesystem::path& output) {
+    NewCatalog merged(output);
+    for (const std::filesystem::path& file : catalogs) {
+        Catalog part = OpenCatalog(file, Catalog::For::Reading);
+        WithCatalog(file, [&] { merged.catalog().Take(part); });
+    }
+    const auto movies =
+        WithCatalog(output, [&] { return static_cast<std::uint64_t>(merged.catalog().Count()); });
+    merged.Finish();
+    fmt::print("{} of {}\n", Counted(movies, "movie"), Counted(catalogs.size(), "catalog"));
+}
+
+}  // namespace cliphost

@@ -1,0 +1,86 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/GoneMovies.h"
+
+#include <set>
+
+#include "reference_host/cliphost/FolderTree.h"
+#include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/util/text/FileUrl.h"
+
+namespace cliphost {
+namespace {
+
+bool IsGone(const std::filesystem::path& movie) {
+    std::error_code ignored;
+    return std::filesystem::status(movie, ignored).type() == std::filesystem::file_type::not_found;
+}
+
+class GoneSearch {
+public:
+    GoneSearch(const MoviesOptions& options, catalog::Catalog& catalog)
+        : options_(options), catalog_(catalog) {}
+
+    void LookIn(const std::filesystem::path& asGiven) {
+        std::error_code error;
+        const std::filesystem::path absolute = std::filesystem::absolute(asGiven, error);
+        const std::filesystem::path folder = (error ? asGiven : absolute / "").lexically_normal();
+        // Movies whose names are no UTF-8 go by URLs.
+        const std::string& bytes = folder.native();
+        for (const std::string& start : {bytes, host::text::FileUrl(bytes)}) {
+            for (const std::string& path : catalog_.PathsThatBegin(start)) {
+                const std::filesystem::path movie = PathOfMachinePath(path);
+                if (IsMeant(movie.lexically_relative(folder), asGiven) && IsGone(movie)) {
+                    gone_.insert(path);
+                }
+            }
+        }
+    }
+
+    void LookAt(const std::filesystem::path& named) {
+        const std::string path = AbsoluteMachinePath(named);
+        const std::filesystem::path folder = PathOfMachinePath(path).parent_path();
+        std::error_code error;
+        if (IsGone(named) && !std::filesystem::is_empty(folder, error) && !error &&
+            catalog_.Find(path)) {
+            gone_.insert(path);
+        }
+    }
+
+    std::vector<std::string> Found() const { return {gone_.begin(), gone_.end()}; }
+
+private:
+    // `rest` is the way from the folder to the movie.
+    bool IsMeant(const std::filesystem::path& rest, const std::filesystem::path& folder) const {
+        const bool isWithin = options_.isRecursive || !rest.has_parent_path();
+        const bool hasEnding = options_.endings.empty() ? rest.extension() == ".mov"
+                                                        : HasEnding(rest, options_.endings);
+        return isWithin && hasEnding &&
+               (options_.shard.IsWhole() ||
+                options_.shard.Holds((folder / rest).lexically_normal()));
+    }
+
+    const MoviesOptions& options_;
+    catalog::Catalog& catalog_;
+    std::set<std::string> gone_;
+};
+
+}  // namespace
+
+std::vector<std::string> GoneMovies(const MoviesOptions& options, const MoviePlan& plan,
+                                    catalog::Catalog& catalog) {
+    GoneSearch search(options, catalog);
+    for (const MoviePlan::GivenFolder& folder : plan.givenFolders()) {
+        if (folder.hasMovies) {
+            search.LookIn(folder.path);
+        }
+    }
+    for (std::size_t place = 0; place < plan.size(); ++place) {
+        if (plan.IsNamed(place)) {
+            search.LookAt(plan[place].movie);
+        }
+    }
+    return search.Found();
+}
+
+}  // namespace cliphost
