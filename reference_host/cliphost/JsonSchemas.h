@@ -13,6 +13,7 @@ inline constexpr char kFormats[] = "formats/1.0";
 inline constexpr char kDump[] = "dump/1.0";
 inline constexpr char kVerify[] = "verify/1.0";
 inline constexpr char kRelink[] = "relink/1.0";
+inline constexpr char kFind[] = "find/1.0";
 inline constexpr char kTypes[] = "types/1.0";
 inline constexpr char kParams[] = "params/1.0";
 inline constexpr char kPlugin[] = "plugin/1.0";

@@ -12,8 +12,14 @@ hosts=$1 shares=$2 movies=$3 out=$4
 shift 4
 mkdir -p "$out"
 
-# A share that fails, or whose machine goes away, is tried on another one.
-seq "$shares" | parallel --quote --sshloginfile "$hosts" --retries 3 --line-buffer --tagstring 'share {}' \
-  --joblog "$out/shares.log" \
-  "${CLIPHOST:-cliphost}" describe "$movies" --recursive --shard "{}/$shares" \
-  --out-dir "$out/{}" --skip-done --jobs 1 --quiet "$@"
+status=0
+each_share() { # each_share VERB OPTION ...
+  # A share that fails, or whose machine goes away, is tried on another one.
+  seq "$shares" | parallel --quote --sshloginfile "$hosts" --retries 3 --line-buffer \
+    --tagstring "$1 {}" --joblog "$out/$1.log" \
+    "${CLIPHOST:-cliphost}" "$1" "$movies" --recursive --shard "{}/$shares" --jobs 1 "${@:2}" || status=1
+}
+each_share describe --out-dir "$out/{}" --skip-done --quiet "$@"
+each_share catalog --update -o "$out/{}.sqlite"
+"${CLIPHOST:-cliphost}" catalog --merge "$out"/[0-9]*.sqlite -o "$out/all.sqlite" || status=1
+exit $status

@@ -38,7 +38,8 @@ say "$movies movies are made"
 begin
 "$build/cliphost" describe "$farm/movies" --recursive --out-dir one --skip-done --jobs 1 --quiet \
   "${pinned[@]}" >log/one
-say "one process describes them in $(since_begin) s"
+"$build/cliphost" catalog "$farm/movies" --recursive --jobs 1 -o one/all.sqlite >>log/one
+say "one process describes and catalogues them in $(since_begin) s"
 
 start_slurm "$farm/slurm" "${nodes[@]}" || fail "Slurm does not start"
 export CLIPHOST=$build/cliphost
@@ -51,10 +52,8 @@ tasks_of_node() { squeue --noheader --states=R --nodelist="$1" --format=%K; }
 node_has_task() { [ -n "$(tasks_of_node "$1")" ]; }
 states() { squeue --noheader --array --states=all --job="$job" --format=%T; }
 done_by() { cat out/"$1"/.cliphost-done/*.jsonl 2>/dev/null | wc -l; }
-# The process of a task, once it has described some movies.
-process_at_work() {
-  (($(done_by "$1") >= 5)) && pgrep -f "^$CLIPHOST describe .* --shard $1/$shares "
-}
+# at_work VERB: "PROCESS TASK" of each task that is at it.
+at_work() { pgrep -a -f "^$CLIPHOST $1 " | sed -nE 's|^([0-9]+) .* --shard ([0-9]+)/.*|\1 \2|p'; }
 
 # A node goes out of use: what runs there ends, and nothing new begins.
 drained=${nodes[-1]}
@@ -64,43 +63,53 @@ last_there=$(tasks_of_node "$drained" | sort -u)
 [ "$(states | grep -c PENDING)" != 0 ] || fail "no task is left that $drained could have had; take more movies"
 say "$drained is drained while it runs task ${last_there//$'\n'/ }"
 
-# Of two tasks that are at work, one is killed, and one put back by Slurm.
-killed='' put_back=''
-interrupt() {
-  local task process
-  for task in $(squeue --noheader --states=R --format=%K); do
-    [ "$task" != "$killed" ] || continue
-    process=$(process_at_work "$task") || continue
-    if [ -z "$killed" ]; then
-      kill -KILL "$process" || continue
-      killed=$task
-      say "task $task is killed when $(done_by "$task") of its movies are done"
-    else
-      scontrol requeue "${job}_$task" || continue
-      put_back=$task
-      say "task $task is put back when $(done_by "$task") of its movies are done"
+# Tasks are interrupted at work, each once.
+interrupted=' '
+hit() { # hit VERB DONE COMMAND ...: a task at this verb that has described so many; the command gets both numbers
+  local process task verb=$1 least=$2
+  while read -r process task; do
+    if [[ $interrupted != *" $task "* ]] && (($(done_by "$task") >= least)) && "${@:3}" "$process" "$task"; then
+      say "task $task $what at $verb, when $(done_by "$task") of its movies were described"
+      interrupted+="$task "
       return 0
     fi
-  done
+  done < <(at_work "$verb")
   return 1
 }
-until_true 120 interrupt || fail "no two tasks could be interrupted at work; take more movies"
+kill_process() { what='is killed' && kill -KILL "$1"; }
+put_back() { what='is put back' && scontrol requeue "${job}_$2"; }
+for hits in 'describe 5 kill_process' 'describe 5 put_back' 'catalog 1 kill_process'; do
+  # shellcheck disable=SC2086
+  until_true 120 hit $hits || fail "no task could be hit at work ($hits); take more movies"
+done
 
 all_ended() { ! states | grep -qvE 'COMPLETED|FAILED|CANCELLED|TIMEOUT|NODE_FAIL'; }
 until_true 600 all_ended || fail "the tasks don't end: $(states | sort | uniq -c)"
 say "the tasks are through after $(since_begin) s; starts by node: $(sed -n 's/^start .* on //p' log/[0-9]* \
   | sort | uniq -c | awk '{ printf "%s%s %d", sep, $2, $1; sep = ", " }')"
 [ "$(states | sort -u)" = COMPLETED ] || fail "not all tasks are well: $(states | sort | uniq -c)"
-for task in "$killed" "$put_back"; do
+for task in $interrupted; do
   grep -q '^start 2 ' "log/$task" || fail "task $task was not started again"
 done
 while read -r task; do
   grep -qx "$task" <<<"$last_there" || fail "task $task was started on $drained after it was drained"
 done < <(grep -l " on $drained\$" log/[0-9]* | sed 's|log/||')
 
-"$here/compare.py" one out movies "$shares" || fail "the outputs are not those of the single run"
+merge=$(sbatch --parsable --dependency="afterany:$job" --output="$farm/log/merge" \
+  --wrap "'$CLIPHOST' catalog --merge '$farm/out/'*.sqlite -o '$farm/out/all.sqlite'")
+job=$merge
+until_true 60 all_ended || fail "the catalogs are not merged"
+cat log/merge
+
+is_as_single() { # is_as_single OUT SHARES
+  "$here/compare.py" one "$1" movies "$2" || fail "the outputs are not those of the single run"
+}
+is_as_single out "$shares"
+read -ra hit_tasks <<<"$interrupted"
+say "of the catalog, task ${hit_tasks[-1]} may have done as many again as its next start read:" \
+  "$(sed -n 's/^\([0-9]*\) catalogued.*/\1/p' "log/${hit_tasks[-1]}")"
 
 printf '2/:\n' >hosts
+say "the same by GNU parallel, 4 shares:"
 "$here/describe_ssh.sh" hosts 4 "$farm/movies" "$farm/out-ssh" "${pinned[@]}" >log/ssh
-say "GNU parallel, 4 shares:"
-"$here/compare.py" one out-ssh movies 4 || fail "the outputs are not those of the single run"
+is_as_single out-ssh 4

@@ -9,13 +9,13 @@ from typing import NamedTuple
 
 class Sample(NamedTuple):
     verb: str
-    form: str
+    form: str  # empty for a call that others need
     arguments: str  # without spaces within one
     status: int = 0
 
     @property
     def call(self):
-        return [self.verb, self.form, *self.arguments.split()]
+        return [self.verb, *self.form.split(), *self.arguments.split()]
 
 
 # In this order: a call reads what those before it wrote.
@@ -63,6 +63,10 @@ SAMPLES = [
         ("relink", "--json", "mapped.aaf --search away -o linked.aaf"),
         ("relink", "--json", "mapped.aaf --search empty -o linked.aaf", 1),
         ("relink", "--json", "bad/no_aaf.aaf --search away -o linked.aaf", 1),
+        ("catalog", "", "in bad --output clips.sqlite", 1),
+        ("find", "--json", "clips.sqlite"),
+        ("find", "--json", "clips.sqlite width:>100000", 1),
+        ("find", "--json", "bad/no_aaf.aaf", 2),
         ("types", "--json", ""),
         ("types", "--json", "--plugin absent", 2),
         ("plugin", "--json", ""),
