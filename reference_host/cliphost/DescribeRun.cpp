@@ -181,10 +181,11 @@ void DescribeRun::SaveBin() {
 }
 
 void DescribeRun::AddEntry(const ordered_json& head, const std::string& description) {
+    std::string entry = EntryText(WithSchema(schema::kDescribe, head), description);
     if (options_.form.lines) {
-        PrintJsonLine(EntryText(head, description));
+        PrintJsonLine(entry);
     } else {
-        entries_.push_back(EntryText(head, description));
+        entries_.push_back(std::move(entry));
     }
 }
 

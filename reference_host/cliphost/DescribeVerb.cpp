@@ -135,9 +135,10 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             status = DescribeRun(running, *options).Run();
         };
         if (options->form.lines) {
-            AnswerFailureInLine(work);
+            AnswerFailureInLine(schema::kDescribe, work);
         } else {
-            AnswerFailureToo(options->form.json, nlohmann::ordered_json::array(), work);
+            AnswerFailureToo(options->form.json, schema::kDescribe, nlohmann::ordered_json::array(),
+                             work);
         }
     });
 }

@@ -16,7 +16,8 @@ constexpr int kLevelOfTree = 1;  // in the answer
 
 // A tree may be large, so it isn't made into another value first.
 void PrintTreeAsJson(const std::filesystem::path& file, const TreeNode& tree) {
-    std::string text = "{\n  \"aaf\": ";
+    std::string text =
+        fmt::format("{{\n  \"{}\": \"{}\",\n  \"aaf\": ", schema::kMember, schema::kDump);
     AppendJsonText(MachinePath(file), text);
     text += ",\n  \"description\": " + ToJson(tree, kLevelOfTree) + "\n}\n";
     fmt::print("{}", text);
@@ -36,7 +37,7 @@ void AddDump(CLI::App& app, const SessionOptions& options) {
     verb->add_option("file", *file, "The AAF file")->required();
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, file, json] {
-        AnswerFailureToo(*json, {{"aaf", MachinePath(*file)}}, [&] {
+        AnswerFailureToo(*json, schema::kDump, {{"aaf", MachinePath(*file)}}, [&] {
             const std::unique_ptr<AafLibrary> library = LoadAafLibrary(options);
             const TreeNode tree = ReadTree(library->Open(*file).get());
             if (*json) {

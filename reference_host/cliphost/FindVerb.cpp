@@ -165,7 +165,8 @@ int Find(const FindOptions& options) {
             throw Failure(kExitCaller, query, error.what());
         }
         if (options.json) {
-            PrintJson({{"catalog", MachinePath(options.catalog)}, {"movies", std::move(movies)}});
+            PrintJson(schema::kFind,
+                      {{"catalog", MachinePath(options.catalog)}, {"movies", std::move(movies)}});
         }
         return count > 0 ? kExitFine : kExitNothing;
     });
@@ -205,7 +206,7 @@ void AddFind(CLI::App& app, int& status) {
                    "them from find -print0")
         ->excludes(json);
     verb->callback([&status, options] {
-        AnswerFailureToo(options->json, {{"catalog", MachinePath(options->catalog)}},
+        AnswerFailureToo(options->json, schema::kFind, {{"catalog", MachinePath(options->catalog)}},
                          [&] { status = Find(*options); });
     });
 }

@@ -143,7 +143,7 @@ void Show(Essence& essence, bool json) {
         Json answer = {{"movie", MachinePath(essence.movie())}};
         AddProblemOrRoute(essence.undescribed(), essence.movie(), answer);
         answer["tracks"] = list;
-        PrintJson(answer);
+        PrintJson(schema::kFormats, std::move(answer));
         return;
     }
     fmt::print("{}\n", host::DisplayPath(essence.movie()));
@@ -169,7 +169,7 @@ void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
     verb->add_flag("--json", *json, kJsonHelp);
     parameters->AddTo(*verb);
     verb->callback([&session, movie, json, parameters] {
-        AnswerFailureToo(*json, {{"movie", MachinePath(*movie)}}, [&] {
+        AnswerFailureToo(*json, schema::kFormats, {{"movie", MachinePath(*movie)}}, [&] {
             Session running(session);
             Essence essence = OpenEssence(running, *movie, *parameters);
             Show(essence, *json);

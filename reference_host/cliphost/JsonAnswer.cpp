@@ -10,7 +10,24 @@
 
 namespace cliphost {
 
-void PrintJson(const nlohmann::ordered_json& answer) {
+using nlohmann::ordered_json;
+
+ordered_json WithSchema(const char* schema, ordered_json members) {
+    ordered_json whole = {{schema::kMember, schema}};
+    for (auto& [name, value] : members.items()) {
+        whole[name] = std::move(value);
+    }
+    return whole;
+}
+
+void PrintJson(const char* schema, ordered_json answer) {
+    if (answer.is_array()) {
+        for (ordered_json& entry : answer) {
+            entry = WithSchema(schema, std::move(entry));
+        }
+    } else {
+        answer = WithSchema(schema, std::move(answer));
+    }
     fmt::print("{}\n", answer.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
 }
 

@@ -95,7 +95,7 @@ void PrintAsJson(const std::filesystem::path& movie, const ShownParameters& show
     for (const ClipParameter& parameter : shown.list) {
         json["parameters"].push_back(ToJson(parameter, shown.file));
     }
-    PrintJson(json);
+    PrintJson(schema::kParams, std::move(json));
 }
 
 }  // namespace
@@ -116,32 +116,33 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
     xml->check(CLI::IsMember(kXml));
     verb->add_flag("--json", options->json, kJsonHelp)->excludes(xml);
     verb->callback([&session, options] {
-        AnswerFailureToo(options->json, {{"movie", MachinePath(options->movie)}}, [&] {
-            Session running(session);
-            host::Ref<NMA::IMediaContainer3> container;
-            const NCFRESULT opened = OpenContainer(running, options->movie, container);
-            if (opened < 0) {
-                throw Failure(ProblemWith(running, options->movie, opened));
-            }
-            // A container takes parameters also for what is no movie.
-            const Description description =
-                DescribeContainer(running, container.get(), options->movie);
-            ShownParameters shown;
-            shown.file = ReadFileFields(*container);
-            if (description.problem && shown.file.order.empty()) {
-                throw Failure(description.problem);
-            }
-            TellRoute(options->movie, running.verbosity());
-            ClipParameters parameters(running, options->movie, *container);
-            options->parameters.ApplyTo(parameters);
-            if (!options->xml.empty()) {
-                fmt::print("{}\n", parameters.Xml(kXml.at(options->xml)));
-                return;
-            }
-            shown.list = parameters.List();
-            shown.set = parameters.SetName();
-            (options->json ? PrintAsJson : PrintText)(options->movie, shown);
-        });
+        AnswerFailureToo(
+            options->json, schema::kParams, {{"movie", MachinePath(options->movie)}}, [&] {
+                Session running(session);
+                host::Ref<NMA::IMediaContainer3> container;
+                const NCFRESULT opened = OpenContainer(running, options->movie, container);
+                if (opened < 0) {
+                    throw Failure(ProblemWith(running, options->movie, opened));
+                }
+                // A container takes parameters also for what is no movie.
+                const Description description =
+                    DescribeContainer(running, container.get(), options->movie);
+                ShownParameters shown;
+                shown.file = ReadFileFields(*container);
+                if (description.problem && shown.file.order.empty()) {
+                    throw Failure(description.problem);
+                }
+                TellRoute(options->movie, running.verbosity());
+                ClipParameters parameters(running, options->movie, *container);
+                options->parameters.ApplyTo(parameters);
+                if (!options->xml.empty()) {
+                    fmt::print("{}\n", parameters.Xml(kXml.at(options->xml)));
+                    return;
+                }
+                shown.list = parameters.List();
+                shown.set = parameters.SetName();
+                (options->json ? PrintAsJson : PrintText)(options->movie, shown);
+            });
     });
 }
 

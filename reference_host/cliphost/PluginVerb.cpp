@@ -71,10 +71,10 @@ void AddPlugin(CLI::App& app, const SessionOptions& options, int&) {
     auto json = std::make_shared<bool>(false);
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, json] {
-        AnswerFailureToo(*json, nlohmann::ordered_json::object(), [&] {
+        AnswerFailureToo(*json, schema::kPlugin, nlohmann::ordered_json::object(), [&] {
             const Session session(options);
             if (*json) {
-                PrintJson(ToJson(session));
+                PrintJson(schema::kPlugin, ToJson(session));
             } else {
                 PrintText(session);
             }

@@ -297,7 +297,7 @@ int Relink(Session& session, RelinkOptions& options) {
         for (std::size_t i = 0; i < std::size(counts); ++i) {
             answer["counts"][kNamesOfRelinked[i]] = counts[i];
         }
-        PrintJson(answer);
+        PrintJson(schema::kRelink, std::move(answer));
         return status;
     }
     std::string text;

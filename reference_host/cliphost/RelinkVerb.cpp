@@ -31,16 +31,18 @@ void AddRelink(CLI::App& app, const SessionOptions& session, int& status) {
                      "Time stamp of what is written, such as 2026-01-31T12:00:00Z");
     AddCheckOptions(*verb, options->check)->required();
     verb->callback([&app, &session, &status, options, pinned] {
-        AnswerFailureToo(options->json, {{"aaf", MachinePath(options->file)}}, [&] {
-            if (options->json && host::system::IsStandardOutput(options->output)) {
-                throw Failure(kExitCaller, "-o", "standard output takes the JSON", "name a file");
-            }
-            TakeDescribingWorkers(app, session, options->check.workers);
-            SessionOptions withTime = session;
-            withTime.pinTime = *pinned;
-            Session running(withTime);
-            status = Relink(running, *options);
-        });
+        AnswerFailureToo(options->json, schema::kRelink, {{"aaf", MachinePath(options->file)}},
+                         [&] {
+                             if (options->json && host::system::IsStandardOutput(options->output)) {
+                                 throw Failure(kExitCaller, "-o", "standard output takes the JSON",
+                                               "name a file");
+                             }
+                             TakeDescribingWorkers(app, session, options->check.workers);
+                             SessionOptions withTime = session;
+                             withTime.pinTime = *pinned;
+                             Session running(withTime);
+                             status = Relink(running, *options);
+                         });
     });
 }
 

@@ -210,7 +210,7 @@ int SamplesRun::Run() {
         Json answer = {{"movie", MachinePath(options_.movie)}, {"fileBytes", fileSize_}};
         AddProblemOrRoute(wrong_ ? wrong_ : essence_.undescribed(), options_.movie, answer);
         answer["tracks"] = std::move(tracks);
-        PrintJson(answer);
+        PrintJson(schema::kSamples, std::move(answer));
     }
     if (wrong_) {
         TellProblem(wrong_, essence_.session().verbosity());
@@ -239,11 +239,12 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_flag("--every", options->every, "List every sample of sound, not only its runs");
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {
-        AnswerFailureToo(options->json, {{"movie", MachinePath(options->movie)}}, [&] {
-            Session running(session);
-            Essence essence = OpenEssence(running, options->movie);
-            status = SamplesRun(essence, *options).Run();
-        });
+        AnswerFailureToo(options->json, schema::kSamples, {{"movie", MachinePath(options->movie)}},
+                         [&] {
+                             Session running(session);
+                             Essence essence = OpenEssence(running, options->movie);
+                             status = SamplesRun(essence, *options).Run();
+                         });
     });
 }
 

@@ -83,7 +83,7 @@ int ShowFolder(Session& session, const std::filesystem::path& folder, bool json)
     if (json) {
         nlohmann::ordered_json answer = ToJson(facts);
         AddProblem(problem, answer);
-        PrintJson(answer);
+        PrintJson(schema::kScan, std::move(answer));
     } else if (facts.claimed) {
         Print(facts);
     }
@@ -116,7 +116,7 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
     verb->add_option("folder", *folder, "The folder")->required();
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, &status, folder, json] {
-        AnswerFailureToo(*json, {{"folder", MachinePath(*folder)}}, [&] {
+        AnswerFailureToo(*json, schema::kScan, {{"folder", MachinePath(*folder)}}, [&] {
             PathForModule(*folder);  // that it is there, and can be named
             std::error_code ignored;
             if (!std::filesystem::is_directory(*folder, ignored)) {

@@ -76,11 +76,11 @@ void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
     auto json = std::make_shared<bool>(false);
     verb->add_flag("--json", *json, "As JSON");
     verb->callback([&options, json] {
-        AnswerFailureToo(*json, nlohmann::ordered_json::object(), [&] {
+        AnswerFailureToo(*json, schema::kTypes, nlohmann::ordered_json::object(), [&] {
             Session session(options);
             const std::vector<FileType> types = ReadTypes(session);
             if (*json) {
-                PrintJson(ToJson(types));
+                PrintJson(schema::kTypes, ToJson(types));
             } else {
                 Print(types);
             }

@@ -176,7 +176,7 @@ int Verify(Session& session, VerifyOptions& options) {
     }
     if (options.json) {
         answer["counts"] = JsonOf(tally);
-        PrintJson(answer);
+        PrintJson(schema::kVerify, std::move(answer));
     } else {
         fmt::print("{}\n", Summary(tally));
     }

@@ -28,7 +28,7 @@ void AddVerify(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_flag("--json", options->json, kJsonHelp);
     AddCheckOptions(*verb, options->check);
     verb->callback([&app, &session, &status, options] {
-        AnswerFailureToo(options->json, nlohmann::ordered_json::object(), [&] {
+        AnswerFailureToo(options->json, schema::kVerify, nlohmann::ordered_json::object(), [&] {
             TakeDescribingWorkers(app, session, options->check.workers);
             Session running(session);
             status = Verify(running, *options);

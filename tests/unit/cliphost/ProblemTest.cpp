@@ -54,12 +54,24 @@ TEST(Problem, TravelsInAFailure) {
 TEST(JsonAnswer, TellsAFailureOnStandardOutputWhereJsonIsAsked) {
     const auto fail = [] { throw Failure(kExitFile, kWhole); };
     testing::internal::CaptureStdout();
-    EXPECT_THROW(AnswerFailureToo(true, {{"movie", "a.mov"}}, fail), Failure);
+    EXPECT_THROW(AnswerFailureToo(true, "params/1.0", {{"movie", "a.mov"}}, fail), Failure);
     const Json told = Json::parse(testing::internal::GetCapturedStdout());
+    EXPECT_EQ(told.begin().key(), "schema");
+    EXPECT_EQ(told["schema"], "params/1.0");
     EXPECT_EQ(told["movie"], "a.mov");
     EXPECT_EQ(told["reason"], kWhole.reason);
     testing::internal::CaptureStdout();
-    EXPECT_THROW(AnswerFailureToo(false, {{"movie", "a.mov"}}, fail), Failure);
-    AnswerFailureToo(true, {{"movie", "a.mov"}}, [] {});
+    EXPECT_THROW(AnswerFailureToo(false, "params/1.0", {{"movie", "a.mov"}}, fail), Failure);
+    AnswerFailureToo(true, "params/1.0", {{"movie", "a.mov"}}, [] {});
     EXPECT_EQ(testing::internal::GetCapturedStdout(), "");
+}
+
+TEST(JsonAnswer, EachEntryOfAListTellsItsSchema) {
+    testing::internal::CaptureStdout();
+    PrintJson("types/1.0", Json::array({{{"index", 0}}, {{"index", 1}}}));
+    EXPECT_EQ(Json::parse(testing::internal::GetCapturedStdout()).dump(),
+              R"([{"schema":"types/1.0","index":0},{"schema":"types/1.0","index":1}])");
+    testing::internal::CaptureStdout();
+    PrintJson("types/1.0", Json::array());
+    EXPECT_EQ(testing::internal::GetCapturedStdout(), "[]\n");
 }
