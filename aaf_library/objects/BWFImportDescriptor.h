@@ -29,7 +29,8 @@ public:
 
     // What the chunk holds behind its head. Its length follows what is written.
     HRESULT Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) override {
-        return ReadStream(*this, prop::RIFFChunk_ChunkData, bytes, buffer, bytesRead);
+        return ReadStream(*this, Required(*this, prop::RIFFChunk_ChunkData), bytes, buffer,
+                          bytesRead);
     }
     HRESULT Write(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesWritten) override {
         const HRESULT result =
@@ -39,10 +40,10 @@ public:
         return result < 0 ? result : PutInteger(prop::RIFFChunk_ChunkLength, length);
     }
     HRESULT SetPosition(aafPosition_t offset) override {
-        return SetStreamPosition(*this, prop::RIFFChunk_ChunkData, offset);
+        return SetStreamPosition(*this, Required(*this, prop::RIFFChunk_ChunkData), offset);
     }
     HRESULT GetPosition(aafPosition_t* offset) override {
-        return ReadStreamPosition(*this, prop::RIFFChunk_ChunkData, offset);
+        return ReadStreamPosition(*this, Required(*this, prop::RIFFChunk_ChunkData), offset);
     }
     HRESULT GetLength(aafLength_t* length) override {
         return ReadInteger(prop::RIFFChunk_ChunkLength, length);

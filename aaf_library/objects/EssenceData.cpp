@@ -48,23 +48,23 @@ HRESULT EssenceData::GetFileMobID(aafMobID_t* fileMobID) {
 }
 
 HRESULT EssenceData::Write(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesWritten) {
-    return WriteStream(*this, prop::EssenceData_Data, bytes, buffer, bytesWritten);
+    return WriteStream(*this, Required(*this, prop::EssenceData_Data), bytes, buffer, bytesWritten);
 }
 
 HRESULT EssenceData::Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) {
-    return ReadStream(*this, prop::EssenceData_Data, bytes, buffer, bytesRead);
+    return ReadStream(*this, Required(*this, prop::EssenceData_Data), bytes, buffer, bytesRead);
 }
 
 HRESULT EssenceData::SetPosition(aafPosition_t offset) {
-    return SetStreamPosition(*this, prop::EssenceData_Data, offset);
+    return SetStreamPosition(*this, Required(*this, prop::EssenceData_Data), offset);
 }
 
 HRESULT EssenceData::GetPosition(aafPosition_t* offset) {
-    return ReadStreamPosition(*this, prop::EssenceData_Data, offset);
+    return ReadStreamPosition(*this, Required(*this, prop::EssenceData_Data), offset);
 }
 
 HRESULT EssenceData::GetSize(aafLength_t* size) {
-    return ReadStreamSize(*this, prop::EssenceData_Data, size);
+    return ReadStreamSize(*this, Required(*this, prop::EssenceData_Data), size);
 }
 
 HRESULT EssenceData::WriteSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,

@@ -27,7 +27,7 @@ struct At {
 };
 
 // No file can make it less than nothing.
-aafLength_t LengthOf(const Object& component) {
+aafLength_t KnownLength(const Object& component) {
     return std::max<aafLength_t>(component.IntegerOr(prop::Component_Length, 0), 0);
 }
 
@@ -44,13 +44,13 @@ HRESULT IntoSequence(const Sequence& sequence, aafOperationChoice_t choice, At& 
         if (part == nullptr) {
             return AAFRESULT_NOT_SOURCE_CLIP;
         }
-        const aafLength_t length = LengthOf(*part);
+        const aafLength_t length = KnownLength(*part);
         if (dynamic_cast<const Transition*>(part) == nullptr) {
             const Component* const next = PartOf(sequence, prop::Sequence_Components, index + 1);
             const bool blends = dynamic_cast<const Transition*>(next) != nullptr;
             before = At{part, start};
             const aafPosition_t end = Plus(start, length);
-            if (at.position < (blends ? Plus(end, -LengthOf(*next)) : end)) {
+            if (at.position < (blends ? Plus(end, -KnownLength(*next)) : end)) {
                 at = At{part, Plus(at.position, -start)};
                 return AAFRESULT_SUCCESS;
             }
@@ -172,7 +172,7 @@ HRESULT Follow(const ContentStorage& storage, aafOperationChoice_t choice, Sourc
     const aafPosition_t start = Plus(clip.IntegerOr(prop::SourceClip_StartTime, 0), at.position);
     place.reference = {id, slotId, Rescaled(start, from, place.editRate)};
     place.length = clip.IsPresent(prop::Component_Length)
-                       ? Rescaled(Plus(LengthOf(clip), -at.position), from, place.editRate)
+                       ? Rescaled(Plus(KnownLength(clip), -at.position), from, place.editRate)
                        : -1;
     return AAFRESULT_SUCCESS;
 }

@@ -9,6 +9,12 @@
 
 namespace aaf {
 
+// For a stream that a class must have: a file leaves it out while it is empty.
+inline const PropertyKey& Required(Object& object, const PropertyKey& key) {
+    object.RequireValue(key);
+    return key;
+}
+
 // Writes at the position, over what is there and behind the end.
 HRESULT WriteStream(Object& object, const PropertyKey& key, aafUInt32 bytes, aafDataBuffer_t buffer,
                     aafUInt32* bytesWritten);
