@@ -356,9 +356,13 @@ RefPtr<Header> File::StopAwaiting() {
     return source;
 }
 
+// What was saved whole can't be had any more once its copy has failed: the file then stays as it
+// is.
 HRESULT File::TakeContent() {
-    const RefPtr<Header> source = StopAwaiting();
-    return source ? TakeMobs(*source->content()) : AAFRESULT_SUCCESS;
+    if (const RefPtr<Header> source = StopAwaiting()) {
+        taken_ = TakeMobs(*source->content());
+    }
+    return taken_;
 }
 
 void File::CopyNow() {
