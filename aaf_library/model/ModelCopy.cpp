@@ -11,6 +11,7 @@
 #include "aaf_library/model/TypeIndirect.h"
 #include "aaf_library/model/TypeRecord.h"
 #include "aaf_library/model/TypeReference.h"
+#include "aaf_library/model/ValueWidth.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 
 // Copies objects from model to model. Everything is found again by id: numbers
@@ -123,9 +124,14 @@ void Model::CopyParameterNamedBy(const PropertyValue& value) {
 
 HRESULT Model::CopyValue(const PropertyValue& source, Object& target,
                          PropertyDefinition& property) {
-    RefPtr<PropertyValue> value = NewValue(*TypeLike(source.type()));
+    TypeDefinition& type = *TypeLike(source.type());
+    RefPtr<PropertyValue> value = NewValue(type);
     CopyReferredTo(source);
-    value->BytesToChange() = source.bytes();
+    if (source.asStored() || HasWidthOf(source.type(), type)) {
+        value->BytesToChange() = source.bytes();
+    } else if (!Widen(source, type, value->BytesToChange())) {
+        return AAFRESULT_BAD_SIZE;
+    }
     value->SetStreamByteOrder(source.streamByteOrder());
     value->KeepAsStored(source.asStored());
     for (const RefPtr<Object>& object : source.objects()) {
