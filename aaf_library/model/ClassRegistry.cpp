@@ -4,6 +4,8 @@
 
 #include "aaf_library/model/DefinitionObjects.h"
 #include "aaf_library/model/Dictionary.h"
+#include "aaf_library/model/OperationDefinition.h"
+#include "aaf_library/model/PluginDefinition.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 
 namespace aaf {

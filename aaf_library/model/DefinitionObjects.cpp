@@ -4,6 +4,8 @@
 
 #include <algorithm>
 
+#include "aaf_library/model/WeakLists.h"
+
 namespace aaf {
 
 GUID DefinitionObject::Identification() const {
@@ -51,26 +53,24 @@ HRESULT CodecDefinition::IsEssenceKindSupported(IAAFDataDef* essenceKind,
     return AAFRESULT_SUCCESS;
 }
 
+HRESULT CodecDefinition::RemoveEssenceKind(IAAFDataDef* essenceKind) {
+    return RemoveWeak(*this, prop::CodecDefinition_DataDefinitions, essenceKind);
+}
+
 HRESULT CodecDefinition::CountEssenceKinds(aafUInt32* result) {
-    if (result == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    *result = static_cast<aafUInt32>(WeakTargets(prop::CodecDefinition_DataDefinitions).size());
-    return AAFRESULT_SUCCESS;
+    return ReadWeakCount(*this, prop::CodecDefinition_DataDefinitions, result);
 }
 
 HRESULT CodecDefinition::GetEssenceKinds(IEnumAAFDataDefs** enumerator) {
-    return MakeEnumerator<IAAFDataDef>(
-        [self = RefPtr<CodecDefinition>(this)](std::size_t index) {
-            const std::vector<Unknown*> kinds =
-                self->WeakTargets(prop::CodecDefinition_DataDefinitions);
-            return RefPtr<Unknown>(index < kinds.size() ? kinds[index] : nullptr);
-        },
-        enumerator);
+    return EnumerateWeak<IAAFDataDef>(this, prop::CodecDefinition_DataDefinitions, enumerator);
 }
 
 HRESULT CodecDefinition::SetFileDescriptorClass(IAAFClassDef* cls) {
     return PutWeak(prop::CodecDefinition_FileDescriptorClass, cls);
+}
+
+HRESULT KLVDataDefinition::SetKLVDataType(IAAFTypeDef* typeDef) {
+    return PutWeak(prop::KLVDataDefinition_KLVDataType, typeDef);
 }
 
 HRESULT ParameterDefinition::Initialize(aafUID_constref id, aafCharacter_constptr name,

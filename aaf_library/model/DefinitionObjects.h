@@ -103,10 +103,16 @@ public:
     }
 };
 
-using OperationDefinition = PlainDefinition<IAAFOperationDef>;
-using PluginDefinition = PlainDefinition<IAAFPluginDef>;
+// What KLV data with a key holds.
+class KLVDataDefinition : public PlainDefinition<IAAFKLVDataDefinition> {
+public:
+    HRESULT GetKLVDataType(IAAFTypeDef** typeDef) override {
+        return ReadWeak(prop::KLVDataDefinition_KLVDataType, typeDef);
+    }
+    HRESULT SetKLVDataType(IAAFTypeDef* typeDef) override;
+};
+
 using InterpolationDefinition = PlainDefinition<IAAFInterpolationDef>;
-using KLVDataDefinition = PlainDefinition<IAAFKLVDataDefinition>;
 using TaggedValueDefinition = PlainDefinition<IAAFTaggedValueDefinition>;
 
 // A codec: the descriptor class and the kinds of data that it serves.
@@ -117,6 +123,7 @@ public:
     HRESULT AddEssenceKind(IAAFDataDef* essenceKind) override {
         return AppendWeak(prop::CodecDefinition_DataDefinitions, essenceKind);
     }
+    HRESULT RemoveEssenceKind(IAAFDataDef* essenceKind) override;
     HRESULT CountEssenceKinds(aafUInt32* result) override;
     HRESULT GetEssenceKinds(IEnumAAFDataDefs** enumerator) override;
     HRESULT GetFileDescriptorClass(IAAFClassDef** cls) override {

@@ -59,6 +59,8 @@ public:
     PropertyDefinition* PropertyLike(ClassDefinition& owner, const PropertyDefinition& source);
     // Registers the definitions that a value of another model refers to.
     void CopyReferredTo(const PropertyValue& value);
+    // A parameter names its definition by a plain id.
+    void CopyParameterNamedBy(const PropertyValue& value);
 
     // -- For those who will copy what the objects hold now, as late as they can.
     class Copier {
@@ -119,6 +121,9 @@ private:
     ClassDefinition* AddBuiltInClass(const BuiltInClass& entry);
     ClassDefinition& Enter(RefPtr<ClassDefinition> definition);
     TypeDefinition& Enter(RefPtr<TypeDefinition> type);
+    // Into the set of that class or property, unless it has the id.
+    template <class Set>
+    void CopyDefinition(const Object* definition, const Set& set, const GUID& id);
     TypeDefinition* TypeLike(const TypeDefinition& source);
     void CallWaiting();
     HRESULT CopyValue(const PropertyValue& source, Object& target, PropertyDefinition& property);
@@ -136,6 +141,7 @@ private:
     PropertyId nextPropertyId_ = 0xFFFF;
     RefPtr<Dictionary> dictionary_;
     std::vector<Copier*> waiting_;
+    std::vector<GUID> copying_;  // definitions on their way into this model
 };
 
 }  // namespace aaf

@@ -1,5 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include <algorithm>
+
 #include "aaf_library/model/ClassDefinition.h"
 #include "aaf_library/model/Dictionary.h"
 #include "aaf_library/model/Model.h"
@@ -9,6 +11,7 @@
 #include "aaf_library/model/TypeIndirect.h"
 #include "aaf_library/model/TypeRecord.h"
 #include "aaf_library/model/TypeReference.h"
+#include "aaf_library/model/ValueWidth.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 
 // Copies objects from model to model. Everything is found again by id: numbers
@@ -66,14 +69,22 @@ PropertyDefinition* Model::PropertyLike(ClassDefinition& owner, const PropertyDe
                                 source.IsOptional(), source.IsUnique());
 }
 
+template <class Set>
+void Model::CopyDefinition(const Object* definition, const Set& set, const GUID& id) {
+    // Definitions may refer to one another in a circle.
+    if (definition == nullptr || dictionary_->FindDefinition(set, id) != nullptr ||
+        std::find(copying_.begin(), copying_.end(), id) != copying_.end()) {
+        return;
+    }
+    copying_.push_back(id);
+    dictionary_->AddDefinition(set, CopyObject(*definition).get());
+    copying_.pop_back();
+}
+
 void Model::CopyReferredTo(const PropertyValue& value) {
     if (value.asStored()) {
         for (const auto& [set, id] : value.asStored()->targets) {
-            const Object* const definition = value.model()->dictionary().FindDefinition(set, id);
-            if (definition != nullptr && dictionary_->FindDefinition(set, id) == nullptr) {
-                const RefPtr<Object> copy = CopyObject(*definition);
-                dictionary_->AddDefinition(set, copy.get());
-            }
+            CopyDefinition(value.model()->dictionary().FindDefinition(set, id), set, id);
         }
         return;
     }
@@ -97,23 +108,30 @@ void Model::CopyReferredTo(const PropertyValue& value) {
     }
     for (std::size_t at = 0; at + kGuidSize <= value.bytes().size(); at += kGuidSize) {
         const GUID id = GuidAt(value.bytes().data() + at);
-        if (dictionary_->FindDefinition(weak->targetClass(), id) != nullptr) {
-            continue;
-        }
-        auto* definition =
-            dynamic_cast<DefinitionObject*>(type.model()->FindTarget(weak->targetClass(), id));
-        if (definition != nullptr) {
-            const RefPtr<Object> copy = CopyObject(*definition);
-            dictionary_->AddDefinition(weak->targetClass(), copy.get());
-        }
+        CopyDefinition(
+            dynamic_cast<DefinitionObject*>(type.model()->FindTarget(weak->targetClass(), id)),
+            weak->targetClass(), id);
+    }
+}
+
+void Model::CopyParameterNamedBy(const PropertyValue& value) {
+    if (value.bytes().size() == kGuidSize) {
+        const GUID id = GuidAt(value.bytes().data());
+        CopyDefinition(value.model()->dictionary().FindDefinition(AUID_AAFParameterDef, id),
+                       AUID_AAFParameterDef, id);
     }
 }
 
 HRESULT Model::CopyValue(const PropertyValue& source, Object& target,
                          PropertyDefinition& property) {
-    RefPtr<PropertyValue> value = NewValue(*TypeLike(source.type()));
+    TypeDefinition& type = *TypeLike(source.type());
+    RefPtr<PropertyValue> value = NewValue(type);
     CopyReferredTo(source);
-    value->BytesToChange() = source.bytes();
+    if (source.asStored() || HasWidthOf(source.type(), type)) {
+        value->BytesToChange() = source.bytes();
+    } else if (!Widen(source, type, value->BytesToChange())) {
+        return AAFRESULT_BAD_SIZE;
+    }
     value->SetStreamByteOrder(source.streamByteOrder());
     value->KeepAsStored(source.asStored());
     for (const RefPtr<Object>& object : source.objects()) {
@@ -138,6 +156,9 @@ RefPtr<Object> Model::CopyObject(const Object& source) {
     for (const auto& entry : source.values()) {
         const PropertyDefinition* from = source.classDefinition().FindProperty(entry.first);
         PropertyDefinition* to = PropertyLike(*definition, *from);
+        if (to != nullptr && to->id() == prop::Parameter_Definition.id) {
+            CopyParameterNamedBy(*entry.second);
+        }
         if (to == nullptr || CopyValue(*entry.second, *copy, *to) < 0) {
             return nullptr;
         }

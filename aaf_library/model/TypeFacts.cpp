@@ -249,6 +249,22 @@ TypeMembers Joined(const TypeMembers& listed, const TypeMembers& known) {
 
 }  // namespace
 
+bool AddMembers(TypeDefinition& type, const TypeFacts& facts) {
+    if (type.kind() != facts.kind) {
+        return false;
+    }
+    const BuiltInType* const entry = FindBuiltInType(type.id());
+    const TypeMembers known = MembersOf(type);
+    const bool isAsBuiltIn = entry != nullptr && known == FactsOf(*entry).members;
+    TypeMembers joined = isAsBuiltIn ? Joined(facts.members, known) : Joined(known, facts.members);
+    if (facts.kind == TypeKind::Enumeration) {
+        static_cast<TypeEnumeration&>(type).Redefine(*type.element(), std::move(joined));
+    } else if (facts.kind == TypeKind::ExtendibleEnumeration) {
+        static_cast<TypeExtendibleEnumeration&>(type).Redefine(std::move(joined));
+    }
+    return true;
+}
+
 bool Redefine(TypeDefinition& type, Model& model, const TypeFacts& facts) {
     if (type.kind() != facts.kind) {
         return false;

@@ -47,6 +47,9 @@ RefPtr<TypeDefinition> MakeType(Model& model, const TypeFacts& facts);
 // front of those that they don't mention, the type that is renamed. False when they say something
 // that a type can't change: that it is of another kind.
 bool Redefine(TypeDefinition& type, Model& model, const TypeFacts& facts);
+// Adds the members of an enumeration that a file has besides, and nothing else. What the type had
+// added before counts more than they do. False for facts of another kind.
+bool AddMembers(TypeDefinition& type, const TypeFacts& facts);
 // The definition of a built-in type, free; makes those that it is built of in the model.
 RefPtr<TypeDefinition> MakeBuiltInType(Model& model, const BuiltInType& entry);
 

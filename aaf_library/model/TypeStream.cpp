@@ -167,4 +167,84 @@ HRESULT TypeStream::ClearStoredByteOrder(IAAFPropertyValue* streamPropertyValue)
     return result;
 }
 
+HRESULT TypeStream::TakeElements(IAAFPropertyValue* argument, IAAFTypeDef* elementType,
+                                 aafUInt32 dataSize, PropertyValue** value,
+                                 const TypeDefinition** element) const {
+    if (elementType == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (const HRESULT result = Take(argument, value); result < 0) {
+        return result;
+    }
+    *element = TypeOf(elementType, model());
+    if (*element == nullptr || (*element)->form() != ValueForm::Data ||
+        (*element)->NativeSize() == 0) {
+        return AAFRESULT_BAD_TYPE;
+    }
+    if (dataSize % (*element)->NativeSize() != 0) {
+        return AAFRESULT_BAD_SIZE;
+    }
+    return (*value)->streamByteOrder() == kBig ? AAFRESULT_INVALID_BYTEORDER : AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::ReadElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                 aafUInt32 dataSize, aafMemPtr_t data, aafUInt32* bytesRead) {
+    PropertyValue* value = nullptr;
+    const TypeDefinition* element = nullptr;
+    if (data == nullptr || bytesRead == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result =
+        TakeElements(streamPropertyValue, elementType, dataSize, &value, &element);
+    if (result < 0) {
+        return result;
+    }
+    const std::size_t native = element->NativeSize();
+    const std::size_t stored = element->StoredSize();
+    auto position = static_cast<std::size_t>(value->position());
+    const std::size_t count =
+        std::min<std::size_t>(dataSize / native, (value->bytes().size() - position) / stored);
+    for (std::size_t at = 0; at < count; ++at, position += stored) {
+        element->CopyNative(value->bytes().data() + position, data + at * native);
+    }
+    value->SetPosition(position);
+    *bytesRead = static_cast<aafUInt32>(count * native);
+    return count == 0 && dataSize > 0 ? AAFRESULT_END_OF_DATA : AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                  aafUInt32 dataSize, aafMemPtr_t data) {
+    PropertyValue* value = nullptr;
+    const TypeDefinition* element = nullptr;
+    if (data == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result =
+        TakeElements(streamPropertyValue, elementType, dataSize, &value, &element);
+    if (result < 0) {
+        return result;
+    }
+    Bytes stored;
+    for (std::size_t at = 0; at < dataSize; at += element->NativeSize()) {
+        element->AppendStored(data + at, stored);
+    }
+    return Write(streamPropertyValue, static_cast<aafUInt32>(stored.size()), stored.data());
+}
+
+HRESULT TypeStream::AppendElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                   aafUInt32 dataSize, aafMemPtr_t data) {
+    PropertyValue* value = nullptr;
+    const TypeDefinition* element = nullptr;
+    if (data == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    const HRESULT result =
+        TakeElements(streamPropertyValue, elementType, dataSize, &value, &element);
+    if (result < 0) {
+        return result;
+    }
+    value->SetPosition(value->bytes().size());
+    return WriteElements(streamPropertyValue, elementType, dataSize, data);
+}
+
 }  // namespace aaf

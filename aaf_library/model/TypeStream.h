@@ -33,9 +33,22 @@ public:
     HRESULT SetStoredByteOrder(IAAFPropertyValue* streamPropertyValue,
                                eAAFByteOrder_t byteOrder) override;
     HRESULT ClearStoredByteOrder(IAAFPropertyValue* streamPropertyValue) override;
+    // Whole elements of a fixed size, in their native layout. A stream in big-endian order is left
+    // to Read and Write (AAFRESULT_INVALID_BYTEORDER).
+    HRESULT ReadElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                         aafUInt32 dataSize, aafMemPtr_t data, aafUInt32* bytesRead) override;
+    HRESULT WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                          aafUInt32 dataSize, aafMemPtr_t data) override;
+    HRESULT AppendElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                           aafUInt32 dataSize, aafMemPtr_t data) override;
 
 protected:
     bool NeedsNameOnly() const override { return true; }
+
+private:
+    // The element's type, when that many bytes of a caller are whole elements of it.
+    HRESULT TakeElements(IAAFPropertyValue* argument, IAAFTypeDef* elementType, aafUInt32 dataSize,
+                         PropertyValue** value, const TypeDefinition** element) const;
 };
 
 }  // namespace aaf

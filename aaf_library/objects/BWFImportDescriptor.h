@@ -4,6 +4,7 @@
 
 #include "aaf_library/model/Enumerator.h"
 #include "aaf_library/objects/PhysicalDescriptors.h"
+#include "aaf_library/objects/StreamAccess.h"
 #include "host_interfaces/aaf/AAFObjects.h"
 #include "not_implemented/AAFObjects.h"
 #include "not_implemented/AAFSoundDescriptors.h"
@@ -13,12 +14,39 @@ namespace aaf {
 // A piece of a broadcast wave file that its importer did not understand.
 class RIFFChunk : public Implements<Object, IAAFRIFFChunk> {
 public:
-    HRESULT Initialize(aafUInt32 chunkID) override { return SetChunkID(chunkID); }
+    // Makes an empty chunk.
+    HRESULT Initialize(aafUInt32 chunkID) override {
+        PutInteger(prop::RIFFChunk_ChunkLength, 0);
+        RequireValue(prop::RIFFChunk_ChunkData);
+        return SetChunkID(chunkID);
+    }
     HRESULT SetChunkID(aafUInt32 chunkID) override {
         return PutInteger(prop::RIFFChunk_ChunkID, chunkID);
     }
     HRESULT GetChunkID(aafUInt32* chunkID) override {
         return ReadInteger(prop::RIFFChunk_ChunkID, chunkID);
+    }
+
+    // What the chunk holds behind its head. Its length follows what is written.
+    HRESULT Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) override {
+        return ReadStream(*this, Required(*this, prop::RIFFChunk_ChunkData), bytes, buffer,
+                          bytesRead);
+    }
+    HRESULT Write(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesWritten) override {
+        const HRESULT result =
+            WriteStream(*this, prop::RIFFChunk_ChunkData, bytes, buffer, bytesWritten);
+        aafLength_t length = 0;
+        ReadStreamSize(*this, prop::RIFFChunk_ChunkData, &length);
+        return result < 0 ? result : PutInteger(prop::RIFFChunk_ChunkLength, length);
+    }
+    HRESULT SetPosition(aafPosition_t offset) override {
+        return SetStreamPosition(*this, Required(*this, prop::RIFFChunk_ChunkData), offset);
+    }
+    HRESULT GetPosition(aafPosition_t* offset) override {
+        return ReadStreamPosition(*this, Required(*this, prop::RIFFChunk_ChunkData), offset);
+    }
+    HRESULT GetLength(aafLength_t* length) override {
+        return ReadInteger(prop::RIFFChunk_ChunkLength, length);
     }
 };
 

@@ -20,6 +20,18 @@ HRESULT Component::RemoveAttribute(IAAFTaggedValue* attribute) {
     return RemoveFromList(*this, prop::Component_Attributes, attribute);
 }
 
+HRESULT Segment::SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) {
+    return offset == nullptr || timecode == nullptr ? AAFRESULT_NULL_PARAM
+                                                    : AAFRESULT_TIMECODE_NOT_FOUND;
+}
+
+HRESULT Segment::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
+                                   aafFrameOffset_t* offset) {
+    return timecode == nullptr || editRate == nullptr || offset == nullptr
+               ? AAFRESULT_NULL_PARAM
+               : AAFRESULT_TIMECODE_NOT_FOUND;
+}
+
 HRESULT Filler::Initialize(IAAFDataDef* dataDef, aafLength_t length) {
     if (dataDef == nullptr) {
         return AAFRESULT_NULL_PARAM;

@@ -60,7 +60,13 @@ public:
 };
 
 // A component that can stand in a slot.
-class Segment : public Implements<Component, IAAFSegment> {};
+class Segment : public Implements<Component, IAAFSegment> {
+public:
+    // AAFRESULT_TIMECODE_NOT_FOUND but for timecodes and sequences of them.
+    HRESULT SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) override;
+    HRESULT SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
+                              aafFrameOffset_t* offset) override;
+};
 
 // Nothing, for a while.
 class Filler : public Implements<Segment, IAAFFiller> {

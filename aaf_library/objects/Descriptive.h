@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <functional>
+
 #include "aaf_library/objects/Arrays.h"
 #include "aaf_library/objects/OtherComponents.h"
 #include "aaf_library/objects/SourceClip.h"
@@ -53,6 +55,15 @@ public:
     HRESULT GetDescribedSlotIDs(aafUInt32 maximum, aafUInt32* ids) override {
         return ReadArray(*this, prop::DescriptiveClip_DescribedSlotIDs, ids,
                          std::size_t{maximum} * sizeof *ids);
+    }
+    HRESULT IsDescribedSlotIDPresent(aafUInt32 id, aafBoolean_t* isPresent) override {
+        return IsElement(*this, prop::DescriptiveClip_DescribedSlotIDs, id, isPresent);
+    }
+    HRESULT AddDescribedSlotID(aafUInt32 id) override {
+        return AddElement(*this, prop::DescriptiveClip_DescribedSlotIDs, id, std::less<>());
+    }
+    HRESULT RemoveDescribedSlotID(aafUInt32 id) override {
+        return RemoveElement(*this, prop::DescriptiveClip_DescribedSlotIDs, id, std::less<>());
     }
 };
 

@@ -2,10 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/EssenceData.h"
 
-#include <algorithm>
-
 #include "aaf_library/objects/ContentStorage.h"
 #include "aaf_library/objects/SourceMob.h"
+#include "aaf_library/objects/StreamAccess.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 
 namespace aaf {
@@ -49,58 +48,45 @@ HRESULT EssenceData::GetFileMobID(aafMobID_t* fileMobID) {
 }
 
 HRESULT EssenceData::Write(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesWritten) {
-    if (buffer == nullptr || bytesWritten == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    PropertyValue* const stream = RequireValue(prop::EssenceData_Data);
-    const auto at = static_cast<std::size_t>(stream->position());
-    Bytes& content = stream->BytesToChange();
-    if (content.size() < at + bytes) {
-        content.resize(at + bytes);
-    }
-    std::copy_n(buffer, bytes, content.begin() + static_cast<std::ptrdiff_t>(at));
-    stream->SetPosition(at + bytes);
-    *bytesWritten = bytes;
-    return AAFRESULT_SUCCESS;
+    return WriteStream(*this, Required(*this, prop::EssenceData_Data), bytes, buffer, bytesWritten);
 }
 
 HRESULT EssenceData::Read(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) {
-    if (buffer == nullptr || bytesRead == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    PropertyValue* const stream = RequireValue(prop::EssenceData_Data);
-    const Bytes& content = stream->bytes();
-    const std::size_t at = std::min(static_cast<std::size_t>(stream->position()), content.size());
-    const std::size_t there = std::min<std::size_t>(bytes, content.size() - at);
-    std::copy_n(content.begin() + static_cast<std::ptrdiff_t>(at), there, buffer);
-    stream->SetPosition(at + there);
-    *bytesRead = static_cast<aafUInt32>(there);
-    return there == 0 && bytes > 0 ? AAFRESULT_END_OF_DATA : AAFRESULT_SUCCESS;
+    return ReadStream(*this, Required(*this, prop::EssenceData_Data), bytes, buffer, bytesRead);
 }
 
 HRESULT EssenceData::SetPosition(aafPosition_t offset) {
-    PropertyValue* const stream = RequireValue(prop::EssenceData_Data);
-    if (offset < 0 || static_cast<std::uint64_t>(offset) > stream->bytes().size()) {
-        return AAFRESULT_BADSAMPLEOFFSET;
-    }
-    stream->SetPosition(static_cast<std::uint64_t>(offset));
-    return AAFRESULT_SUCCESS;
+    return SetStreamPosition(*this, Required(*this, prop::EssenceData_Data), offset);
 }
 
 HRESULT EssenceData::GetPosition(aafPosition_t* offset) {
-    if (offset == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    *offset = static_cast<aafPosition_t>(RequireValue(prop::EssenceData_Data)->position());
-    return AAFRESULT_SUCCESS;
+    return ReadStreamPosition(*this, Required(*this, prop::EssenceData_Data), offset);
 }
 
 HRESULT EssenceData::GetSize(aafLength_t* size) {
-    if (size == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    *size = static_cast<aafLength_t>(RequireValue(prop::EssenceData_Data)->bytes().size());
-    return AAFRESULT_SUCCESS;
+    return ReadStreamSize(*this, Required(*this, prop::EssenceData_Data), size);
+}
+
+HRESULT EssenceData::WriteSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
+                                      aafUInt32* bytesWritten) {
+    return WriteStream(*this, prop::EssenceData_SampleIndex, bytes, buffer, bytesWritten);
+}
+
+HRESULT EssenceData::ReadSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
+                                     aafUInt32* bytesRead) {
+    return ReadStream(*this, prop::EssenceData_SampleIndex, bytes, buffer, bytesRead);
+}
+
+HRESULT EssenceData::SetSampleIndexPosition(aafPosition_t offset) {
+    return SetStreamPosition(*this, prop::EssenceData_SampleIndex, offset);
+}
+
+HRESULT EssenceData::GetSampleIndexPosition(aafPosition_t* offset) {
+    return ReadStreamPosition(*this, prop::EssenceData_SampleIndex, offset);
+}
+
+HRESULT EssenceData::GetSampleIndexSize(aafLength_t* size) {
+    return ReadStreamSize(*this, prop::EssenceData_SampleIndex, size);
 }
 
 }  // namespace aaf

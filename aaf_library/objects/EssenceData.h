@@ -27,6 +27,14 @@ public:
     HRESULT SetPosition(aafPosition_t offset) override;
     HRESULT GetPosition(aafPosition_t* offset) override;
     HRESULT GetSize(aafLength_t* size) override;
+
+    // Where its samples are, in a form that the codec knows.
+    HRESULT WriteSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer,
+                             aafUInt32* bytesWritten) override;
+    HRESULT ReadSampleIndex(aafUInt32 bytes, aafDataBuffer_t buffer, aafUInt32* bytesRead) override;
+    HRESULT SetSampleIndexPosition(aafPosition_t offset) override;
+    HRESULT GetSampleIndexPosition(aafPosition_t* offset) override;
+    HRESULT GetSampleIndexSize(aafLength_t* size) override;
 };
 
 }  // namespace aaf

@@ -16,7 +16,8 @@ HRESULT CopyExtensions(Model& source, Model& target) {
     try {
         stored::MetaClosure closure(source, stored::MetaClosure::BuiltIn::LeftOut);
         closure.AddExtensions();
-        const stored::MetaRegistration registration(closure.records(), target);
+        const stored::MetaRegistration registration(closure.records(), target,
+                                                    stored::MetaRegistration::Words::OfAnother);
         return AAFRESULT_SUCCESS;
     } catch (const stored::StoredError& problem) {
         TellDiagnostic(problem.what());

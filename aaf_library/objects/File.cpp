@@ -3,6 +3,7 @@
 #include "aaf_library/objects/File.h"
 
 #include "aaf_library/model/Dictionary.h"
+#include "aaf_library/model/ValueWidth.h"
 #include "aaf_library/objects/ContentStorage.h"
 #include "aaf_library/objects/Extensions.h"
 #include "aaf_library/objects/Listeners.h"
@@ -311,13 +312,14 @@ HRESULT File::TakeMobs(const ContentStorage& from) {
     return result;
 }
 
-// Whether the target is as it was made, so that all that goes into it comes from here.
+// Whether the target is as it was made, so that all that goes into it comes from here, and whether
+// it would hold the same bytes.
 bool File::CanSaveContentAs(const File& target) const {
     const ContentStorage* const from = header_->content();
     const ContentStorage* const to = target.header_->content();
     return target.access_ == Access::Write && !target.saved_ && !target.isShown_ &&
            from != nullptr && to != nullptr && from->classId() == to->classId() &&
-           from->HoldsMobsAlone();
+           from->HoldsMobsAlone() && !HasRedefinedTypes(*model_);
 }
 
 // Writes the target without a copy of what goes into it. False, and nothing is told, where that
@@ -356,9 +358,13 @@ RefPtr<Header> File::StopAwaiting() {
     return source;
 }
 
+// What was saved whole can't be had any more once its copy has failed: the file then stays as it
+// is.
 HRESULT File::TakeContent() {
-    const RefPtr<Header> source = StopAwaiting();
-    return source ? TakeMobs(*source->content()) : AAFRESULT_SUCCESS;
+    if (const RefPtr<Header> source = StopAwaiting()) {
+        taken_ = TakeMobs(*source->content());
+    }
+    return taken_;
 }
 
 void File::CopyNow() {

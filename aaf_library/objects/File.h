@@ -70,8 +70,9 @@ private:
     bool largeSectors_ = false;
     bool failsUnsaved_ = false;  // Close fails while there is something to save
     bool saved_ = false;
-    bool isShown_ = false;    // somebody may hold objects of the file
-    RefPtr<Header> awaited_;  // of the file whose mobs are still to be copied
+    bool isShown_ = false;               // somebody may hold objects of the file
+    RefPtr<Header> awaited_;             // of the file whose mobs are still to be copied
+    HRESULT taken_ = AAFRESULT_SUCCESS;  // how that went, for all that need the copy
 };
 
 }  // namespace aaf

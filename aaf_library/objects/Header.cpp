@@ -2,9 +2,17 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/Header.h"
 
+#include <algorithm>
+#include <cstring>
+#include <vector>
+
+#include "aaf_library/model/DefinitionObjects.h"
 #include "aaf_library/model/Model.h"
+#include "aaf_library/objects/Arrays.h"
 #include "aaf_library/objects/ContentStorage.h"
+#include "aaf_library/objects/EssenceDescriptor.h"
 #include "aaf_library/objects/Identification.h"
+#include "aaf_library/objects/SourceMob.h"
 
 namespace aaf {
 
@@ -15,6 +23,28 @@ constexpr aafInt16 kLittleEndian = 0x4949;
 
 constexpr aafUInt32 kObjectModelVersion = 1;
 constexpr aafVersionType_t kFileVersion{1, 1};
+
+bool PrecedesInBytes(const aafUID_t& left, const aafUID_t& right) {
+    return std::memcmp(&left, &right, sizeof left) < 0;
+}
+
+// The ids of the containers that a descriptor and its parts name.
+void CollectContainers(const EssenceDescriptor* descriptor, std::vector<aafUID_t>& ids) {
+    if (descriptor == nullptr) {
+        return;
+    }
+    const auto* const container = dynamic_cast<const ContainerDefinition*>(
+        descriptor->WeakTarget(prop::FileDescriptor_ContainerFormat));
+    if (container != nullptr) {
+        ids.push_back(container->Identification());
+    }
+    const aafUInt32 parts = descriptor->CountObjects(prop::MultipleDescriptor_FileDescriptors);
+    for (aafUInt32 at = 0; at < parts; ++at) {
+        CollectContainers(dynamic_cast<const EssenceDescriptor*>(
+                              descriptor->ObjectAt(prop::MultipleDescriptor_FileDescriptors, at)),
+                          ids);
+    }
+}
 
 }  // namespace
 
@@ -185,6 +215,53 @@ HRESULT Header::GetNativeByteOrder(eAAFByteOrder_t* order) {
     const bool little = *reinterpret_cast<const aafUInt8*>(&probe) == 1;
     *order = little ? kAAFByteOrderLittle : kAAFByteOrderBig;
     return AAFRESULT_SUCCESS;
+}
+
+HRESULT Header::UpdateEssenceContainers() {
+    std::vector<aafUID_t> ids;
+    const ContentStorage* const storage = content();
+    for (aafUInt32 at = 0; storage != nullptr && at < storage->MobCount(); ++at) {
+        if (const auto* const mob = dynamic_cast<const SourceMob*>(storage->MobAt(at))) {
+            CollectContainers(mob->descriptor(), ids);
+        }
+    }
+    std::sort(ids.begin(), ids.end(), PrecedesInBytes);
+    ids.erase(std::unique(ids.begin(), ids.end()), ids.end());
+    return PutSet(*this, prop::Header_EssenceContainers, std::move(ids), PrecedesInBytes);
+}
+
+HRESULT Header::CountEssenceContainers(aafUInt32* count) {
+    return CountElements(*this, prop::Header_EssenceContainers, sizeof(aafUID_t), count);
+}
+
+HRESULT Header::GetEssenceContainers(aafUInt32 maximum, aafUID_t* ids) {
+    return ReadArray(*this, prop::Header_EssenceContainers, ids,
+                     std::size_t{maximum} * sizeof *ids);
+}
+
+HRESULT Header::IsEssenceContainerPresent(aafUID_constref id, aafBoolean_t* isPresent) {
+    return IsElement(*this, prop::Header_EssenceContainers, id, isPresent);
+}
+
+HRESULT Header::CountDescriptiveSchemes(aafUInt32* count) {
+    return CountElements(*this, prop::Header_DescriptiveSchemes, sizeof(aafUID_t), count);
+}
+
+HRESULT Header::GetDescriptiveSchemes(aafUInt32 maximum, aafUID_t* ids) {
+    return ReadArray(*this, prop::Header_DescriptiveSchemes, ids,
+                     std::size_t{maximum} * sizeof *ids);
+}
+
+HRESULT Header::IsDescriptiveSchemePresent(aafUID_constref id, aafBoolean_t* isPresent) {
+    return IsElement(*this, prop::Header_DescriptiveSchemes, id, isPresent);
+}
+
+HRESULT Header::AddDescriptiveScheme(aafUID_constref id) {
+    return AddElement(*this, prop::Header_DescriptiveSchemes, id, PrecedesInBytes);
+}
+
+HRESULT Header::RemoveDescriptiveScheme(aafUID_constref id) {
+    return RemoveElement(*this, prop::Header_DescriptiveSchemes, id, PrecedesInBytes);
 }
 
 }  // namespace aaf

@@ -87,6 +87,19 @@ public:
         return PutStruct(prop::Header_OperationalPattern, operationalPatternID);
     }
 
+    // -- The wrappings of the essence that the file tells of. They are those of the last update.
+    HRESULT UpdateEssenceContainers() override;
+    HRESULT CountEssenceContainers(aafUInt32* count) override;
+    HRESULT GetEssenceContainers(aafUInt32 maximum, aafUID_t* ids) override;
+    HRESULT IsEssenceContainerPresent(aafUID_constref id, aafBoolean_t* isPresent) override;
+
+    // -- The schemes of its descriptive metadata
+    HRESULT CountDescriptiveSchemes(aafUInt32* count) override;
+    HRESULT GetDescriptiveSchemes(aafUInt32 maximum, aafUID_t* ids) override;
+    HRESULT IsDescriptiveSchemePresent(aafUID_constref id, aafBoolean_t* isPresent) override;
+    HRESULT AddDescriptiveScheme(aafUID_constref id) override;
+    HRESULT RemoveDescriptiveScheme(aafUID_constref id) override;
+
 private:
     template <class Operation>
     HRESULT OnContent(Operation operation) const;

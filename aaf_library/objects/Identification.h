@@ -3,6 +3,7 @@
 #pragma once
 
 #include "aaf_library/model/Object.h"
+#include "aaf_library/objects/Checks.h"
 #include "aaf_library/objects/Fresh.h"
 #include "host_interfaces/aaf/AAFFile.h"
 #include "not_implemented/AAFFile.h"
@@ -21,58 +22,67 @@ public:
                        aafCharacter_constptr productVersionString,
                        aafUID_constref productID) override;
     HRESULT GetCompanyName(aafCharacter* companyName, aafUInt32 bufSize) override {
-        return IsInitialized() ? ReadString(prop::Identification_CompanyName, companyName, bufSize)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadString(prop::Identification_CompanyName, companyName, bufSize);
+        });
     }
     HRESULT GetCompanyNameBufLen(aafUInt32* bufSize) override {
-        return IsInitialized() ? ReadStringLength(prop::Identification_CompanyName, bufSize)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadStringLength(prop::Identification_CompanyName, bufSize);
+        });
     }
     HRESULT GetProductName(aafCharacter* productName, aafUInt32 bufSize) override {
-        return IsInitialized() ? ReadString(prop::Identification_ProductName, productName, bufSize)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadString(prop::Identification_ProductName, productName, bufSize);
+        });
     }
     HRESULT GetProductNameBufLen(aafUInt32* bufSize) override {
-        return IsInitialized() ? ReadStringLength(prop::Identification_ProductName, bufSize)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadStringLength(prop::Identification_ProductName, bufSize);
+        });
     }
     HRESULT GetProductVersionString(aafCharacter* productVersionString,
                                     aafUInt32 bufSize) override {
-        return IsInitialized() ? ReadString(prop::Identification_ProductVersionString,
-                                            productVersionString, bufSize)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadString(prop::Identification_ProductVersionString, productVersionString,
+                              bufSize);
+        });
     }
     HRESULT GetProductVersionStringBufLen(aafUInt32* bufSize) override {
-        return IsInitialized()
-                   ? ReadStringLength(prop::Identification_ProductVersionString, bufSize)
-                   : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadStringLength(prop::Identification_ProductVersionString, bufSize);
+        });
     }
     HRESULT GetProductVersion(aafProductVersion_t* version) override {
-        return IsInitialized() ? ReadStruct(prop::Identification_ProductVersion, version)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadStruct(prop::Identification_ProductVersion, version);
+        });
     }
     HRESULT SetProductVersion(aafProductVersion_constref version) override {
         return PutStruct(prop::Identification_ProductVersion, version);
     }
     HRESULT GetProductID(aafUID_t* productID) override {
-        return IsInitialized() ? ReadStruct(prop::Identification_ProductID, productID)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(
+            IsInitialized(), [&] { return ReadStruct(prop::Identification_ProductID, productID); });
     }
     HRESULT GetDate(aafTimeStamp_t* timestamp) override {
-        return IsInitialized() ? ReadStruct(prop::Identification_Date, timestamp)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(),
+                               [&] { return ReadStruct(prop::Identification_Date, timestamp); });
     }
     HRESULT GetRefImplVersion(aafProductVersion_t* version) override {
-        return IsInitialized() ? ReadStruct(prop::Identification_ToolkitVersion, version)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadStruct(prop::Identification_ToolkitVersion, version);
+        });
     }
     HRESULT GetPlatform(aafCharacter* platform, aafUInt32 bufSize) override {
-        return IsInitialized() ? ReadString(prop::Identification_Platform, platform, bufSize)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadString(prop::Identification_Platform, platform, bufSize);
+        });
     }
     HRESULT GetPlatformBufLen(aafUInt32* bufSize) override {
-        return IsInitialized() ? ReadStringLength(prop::Identification_Platform, bufSize)
-                               : AAFRESULT_NOT_INITIALIZED;
+        return OnceInitialized(IsInitialized(), [&] {
+            return ReadStringLength(prop::Identification_Platform, bufSize);
+        });
     }
     HRESULT GetGenerationID(aafUID_t* generation) override;
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/Mob.h"
 
+#include "aaf_library/objects/Component.h"
 #include "aaf_library/objects/ContentStorage.h"
 #include "aaf_library/objects/MobSlot.h"
 
@@ -86,6 +87,28 @@ HRESULT Mob::LookupSlot(aafSlotID_t slotId, IAAFMobSlot** destSlot) {
     *destSlot = nullptr;
     MobSlot* const slot = FindSlot(slotId);
     return slot == nullptr ? AAFRESULT_SLOT_NOT_FOUND : GiveOut(slot, destSlot);
+}
+
+HRESULT Mob::OffsetToMobTimecode(IAAFSegment* tcSeg, aafPosition_t* offset, aafTimecode_t* result) {
+    if (offset == nullptr || result == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (tcSeg != nullptr) {
+        return tcSeg->SegmentOffsetToTC(offset, result);
+    }
+    const aafUInt32 count = CountObjects(prop::Mob_Slots);
+    for (aafUInt32 at = 0; at < count; ++at) {
+        const MobSlot* const slot = SlotAt(at);
+        Segment* const segment = slot == nullptr ? nullptr : slot->segment();
+        if (segment == nullptr) {
+            continue;
+        }
+        const HRESULT found = segment->SegmentOffsetToTC(offset, result);
+        if (found != AAFRESULT_TIMECODE_NOT_FOUND) {
+            return found;
+        }
+    }
+    return AAFRESULT_TIMECODE_NOT_FOUND;
 }
 
 }  // namespace aaf

@@ -136,6 +136,10 @@ public:
         return RemoveFromList(*this, prop::Mob_KLVData, data);
     }
 
+    // The timecode at an offset of that segment, or of the first slot that has timecode.
+    HRESULT OffsetToMobTimecode(IAAFSegment* tcSeg, aafPosition_t* offset,
+                                aafTimecode_t* result) override;
+
     // -- Other mobs and files
     HRESULT ChangeRef(aafMobID_constref oldMobID, aafMobID_constref newMobID) override;
     HRESULT CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includeMedia,

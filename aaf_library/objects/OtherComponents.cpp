@@ -2,6 +2,10 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/objects/OtherComponents.h"
 
+#include "aaf_library/model/Model.h"
+#include "aaf_library/model/TypeDefinition.h"
+#include "host_interfaces/aaf/AAFTypeDefinitions.h"
+
 namespace aaf {
 
 namespace {
@@ -20,6 +24,33 @@ HRESULT ReadTyped(const Object& object, const PropertyKey& key, aafUInt32 valueS
         *bytesRead = size;
     }
     return result;
+}
+
+// The first value, of the type that a parameter has by its definition.
+HRESULT PutFirst(Object& object, const PropertyKey& key, Parameter& parameter, aafUInt32 valueSize,
+                 aafDataBuffer_t value) {
+    IAAFTypeDef* type = nullptr;
+    const HRESULT result = parameter.Parameter::GetTypeDefinition(&type);
+    if (result < 0) {
+        return result;
+    }
+    const RefPtr<IAAFTypeDef> holder = RefPtr<IAAFTypeDef>::Adopt(type);
+    return object.PutIndirect(key, type, value, valueSize);
+}
+
+// Another value of the same type.
+HRESULT PutNext(Object& object, const PropertyKey& key, aafUInt32 valueSize,
+                aafDataBuffer_t value) {
+    if (value == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    IAAFTypeDef* type = nullptr;
+    const HRESULT result = object.ReadIndirectType(key, &type);
+    if (result < 0) {
+        return result == AAFRESULT_PROP_NOT_PRESENT ? AAFRESULT_NOT_INITIALIZED : result;
+    }
+    const RefPtr<IAAFTypeDef> holder = RefPtr<IAAFTypeDef>::Adopt(type);
+    return object.PutIndirect(key, type, value, valueSize);
 }
 
 }  // namespace
@@ -74,7 +105,149 @@ HRESULT OperationGroup::LookupParameter(aafArgIDType_constref argID, IAAFParamet
     return AAFRESULT_OBJECT_NOT_FOUND;
 }
 
+HRESULT OperationGroup::ReadDefinition(OperationDefinition** definition) const {
+    if (!IsPresent(prop::OperationGroup_Operation)) {
+        return AAFRESULT_PROP_NOT_PRESENT;
+    }
+    *definition = dynamic_cast<OperationDefinition*>(WeakTarget(prop::OperationGroup_Operation));
+    return *definition == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : AAFRESULT_SUCCESS;
+}
+
+HRESULT OperationGroup::IsATimeWarp(aafBoolean_t* isTimeWarp) {
+    if (isTimeWarp == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    OperationDefinition* definition = nullptr;
+    const HRESULT result = ReadDefinition(&definition);
+    if (result >= 0) {
+        *isTimeWarp = definition->IntegerOr(prop::OperationDefinition_IsTimeWarp, kAAFFalse) != 0
+                          ? kAAFTrue
+                          : kAAFFalse;
+    }
+    return result;
+}
+
+HRESULT OperationGroup::IsValidTranOperation(aafBoolean_t* validTransition) {
+    if (validTransition == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    OperationDefinition* definition = nullptr;
+    const HRESULT result = ReadDefinition(&definition);
+    if (result >= 0) {
+        *validTransition = definition->IntegerOr(prop::OperationDefinition_NumberInputs, 0) == 2
+                               ? kAAFTrue
+                               : kAAFFalse;
+    }
+    return result;
+}
+
 // Parameters
+
+HRESULT Parameter::GetParameterDefinition(IAAFParameterDef** parmDef) {
+    aafUID_t id{};
+    if (parmDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (const HRESULT result = ReadStruct(prop::Parameter_Definition, &id); result < 0) {
+        return result;
+    }
+    Unknown* const definition = model()->FindTarget(AUID_AAFParameterDef, id);
+    return definition == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : GiveOut(definition, parmDef);
+}
+
+HRESULT Parameter::GetTypeDefinition(IAAFTypeDef** typeDef) {
+    if (typeDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    IAAFParameterDef* definition = nullptr;
+    const HRESULT result = GetParameterDefinition(&definition);
+    if (result < 0) {
+        return result;
+    }
+    const RefPtr<IAAFParameterDef> holder = RefPtr<IAAFParameterDef>::Adopt(definition);
+    return definition->GetTypeDefinition(typeDef);
+}
+
+HRESULT Parameter::PutParameterDefinition(IAAFParameterDef* argument) {
+    const auto* const definition = ImplementationAs<ParameterDefinition>(argument);
+    if (definition == nullptr) {
+        return AAFRESULT_INVALID_OBJ;
+    }
+    if (definition->owner() == nullptr) {
+        return AAFRESULT_OBJECT_NOT_ATTACHED;
+    }
+    const aafUID_t id = definition->Identification();
+    return model()->FindTarget(AUID_AAFParameterDef, id) == nullptr
+               ? AAFRESULT_INVALID_OBJ
+               : PutStruct(prop::Parameter_Definition, id);
+}
+
+HRESULT ConstantValue::Initialize(IAAFParameterDef* parameterDef, aafUInt32 valueSize,
+                                  aafDataBuffer_t value) {
+    if (parameterDef == nullptr || value == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (IsPresent(prop::ConstantValue_Value)) {
+        return AAFRESULT_ALREADY_INITIALIZED;
+    }
+    const HRESULT result = PutParameterDefinition(parameterDef);
+    return result < 0 ? result
+                      : PutFirst(*this, prop::ConstantValue_Value, *this, valueSize, value);
+}
+
+HRESULT ConstantValue::SetValue(aafUInt32 valueSize, aafDataBuffer_t value) {
+    return PutNext(*this, prop::ConstantValue_Value, valueSize, value);
+}
+
+HRESULT VaryingValue::Initialize(IAAFParameterDef* parameterDef,
+                                 IAAFInterpolationDef* interpolation) {
+    if (parameterDef == nullptr || interpolation == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (IsPresent(prop::VaryingValue_Interpolation)) {
+        return AAFRESULT_ALREADY_INITIALIZED;
+    }
+    const HRESULT result = PutParameterDefinition(parameterDef);
+    return result < 0 ? result : PutWeak(prop::VaryingValue_Interpolation, interpolation);
+}
+
+HRESULT VaryingValue::GetValueBufLen(aafInt32* len) {
+    if (len == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    IAAFTypeDef* type = nullptr;
+    const HRESULT result = GetTypeDefinition(&type);
+    if (result < 0) {
+        return result;
+    }
+    const RefPtr<IAAFTypeDef> holder = RefPtr<IAAFTypeDef>::Adopt(type);
+    const TypeDefinition* const known = TypeOf(type, model());
+    if (known == nullptr || known->NativeSize() == 0) {
+        return AAFRESULT_BAD_TYPE;
+    }
+    *len = static_cast<aafInt32>(known->NativeSize());
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT ControlPoint::Initialize(IAAFVaryingValue* varyingValue, aafRational_constref time,
+                                 aafUInt32 valueSize, aafDataBuffer_t value) {
+    if (varyingValue == nullptr || value == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    auto* const parameter = ImplementationAs<Parameter>(varyingValue);
+    if (parameter == nullptr) {
+        return AAFRESULT_INVALID_OBJ;
+    }
+    if (IsPresent(prop::ControlPoint_Value)) {
+        return AAFRESULT_ALREADY_INITIALIZED;
+    }
+    const HRESULT result = PutFirst(*this, prop::ControlPoint_Value, *parameter, valueSize, value);
+    return result < 0 ? result : SetTime(time);
+}
+
+HRESULT ControlPoint::SetValue(aafUInt32 valueSize, aafDataBuffer_t value) {
+    return PutNext(*this, prop::ControlPoint_Value, valueSize, value);
+}
 
 HRESULT ConstantValue::GetValue(aafUInt32 valueSize, aafDataBuffer_t value, aafUInt32* bytesRead) {
     return ReadTyped(*this, prop::ConstantValue_Value, valueSize, value, bytesRead);

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "aaf_library/model/Enumerator.h"
+#include "aaf_library/model/OperationDefinition.h"
 #include "aaf_library/objects/Annotations.h"
 #include "aaf_library/objects/Checks.h"
 #include "aaf_library/objects/Component.h"
@@ -15,8 +16,7 @@
 #include "not_implemented/AAFTimecodes.h"
 
 // Components and parameters that this system does not make but meets in the
-// files of other programs: it reads, copies and saves them with all their
-// properties. What a class does not say here answers not implemented.
+// files of other programs.
 
 namespace aaf {
 
@@ -86,12 +86,32 @@ public:
         return EnumerateList<IAAFParameter>(this, prop::OperationGroup_Parameters, enumerator);
     }
     HRESULT LookupParameter(aafArgIDType_constref argID, IAAFParameter** parameter) override;
+    // Whether its definition says so.
+    HRESULT IsATimeWarp(aafBoolean_t* isTimeWarp) override;
+    // Whether it takes two inputs, as a transition has.
+    HRESULT IsValidTranOperation(aafBoolean_t* validTransition) override;
+
+private:
+    HRESULT ReadDefinition(OperationDefinition** definition) const;
 };
 
-class Parameter : public Implements<Object, IAAFParameter> {};
+// A value of an effect. The dictionary's definition with its id tells the type.
+class Parameter : public Implements<Object, IAAFParameter> {
+public:
+    HRESULT GetParameterDefinition(IAAFParameterDef** parmDef) override;
+    HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) override;
+
+protected:
+    // A definition of the dictionary: a free one is AAFRESULT_OBJECT_NOT_ATTACHED, that of another
+    // file AAFRESULT_INVALID_OBJ.
+    HRESULT PutParameterDefinition(IAAFParameterDef* definition);
+};
 
 class ConstantValue : public Implements<Parameter, IAAFConstantValue> {
 public:
+    HRESULT Initialize(IAAFParameterDef* parameterDef, aafUInt32 valueSize,
+                       aafDataBuffer_t value) override;
+    HRESULT SetValue(aafUInt32 valueSize, aafDataBuffer_t value) override;
     HRESULT GetValue(aafUInt32 valueSize, aafDataBuffer_t value, aafUInt32* bytesRead) override;
     HRESULT GetValueBufLen(aafUInt32* len) override;
     HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) override;
@@ -110,10 +130,21 @@ public:
         return ReadObjectAt(prop::VaryingValue_PointList, index, controlPoint);
     }
     HRESULT RemoveControlPointAt(aafUInt32 index) override;
+    HRESULT Initialize(IAAFParameterDef* parameterDef,
+                       IAAFInterpolationDef* interpolation) override;
+    HRESULT GetInterpolationDefinition(IAAFInterpolationDef** interpolation) override {
+        return ReadWeak(prop::VaryingValue_Interpolation, interpolation);
+    }
+    // The size of a value between two points.
+    HRESULT GetValueBufLen(aafInt32* len) override;
 };
 
 class ControlPoint : public Implements<Object, IAAFControlPoint> {
 public:
+    // The value has the type of the parameter that it is made for, which doesn't get the point yet.
+    HRESULT Initialize(IAAFVaryingValue* varyingValue, aafRational_constref time,
+                       aafUInt32 valueSize, aafDataBuffer_t value) override;
+    HRESULT SetValue(aafUInt32 valueSize, aafDataBuffer_t value) override;
     HRESULT GetTime(aafRational_t* time) override {
         return ReadStruct(prop::ControlPoint_Time, time);
     }

@@ -3,6 +3,7 @@
 #include "aaf_library/objects/Sequence.h"
 
 #include "aaf_library/objects/OtherComponents.h"
+#include "aaf_library/objects/Rates.h"
 
 namespace aaf {
 
@@ -168,6 +169,51 @@ HRESULT Sequence::RemoveComponentAt(aafUInt32 index) {
 
 HRESULT Sequence::GetComponents(IEnumAAFComponents** enumerator) {
     return MakeEnumerator<IAAFComponent>(this, prop::Sequence_Components, enumerator);
+}
+
+HRESULT Sequence::SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) {
+    if (offset == nullptr || timecode == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    aafPosition_t start = 0;
+    const aafUInt32 count = CountObjects(prop::Sequence_Components);
+    for (aafUInt32 at = 0; at < count && *offset >= start; ++at) {
+        auto* const part = dynamic_cast<Segment*>(ComponentAt(at));
+        if (part == nullptr) {
+            return AAFRESULT_TIMECODE_NOT_FOUND;
+        }
+        const aafPosition_t end = Plus(start, LengthOf(*part));
+        if (*offset < end) {
+            aafPosition_t inside = *offset - start;
+            return part->SegmentOffsetToTC(&inside, timecode);
+        }
+        start = end;
+    }
+    return AAFRESULT_BADSAMPLEOFFSET;
+}
+
+HRESULT Sequence::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
+                                    aafFrameOffset_t* offset) {
+    if (timecode == nullptr || editRate == nullptr || offset == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    HRESULT result = AAFRESULT_TIMECODE_NOT_FOUND;
+    aafPosition_t start = 0;
+    const aafUInt32 count = CountObjects(prop::Sequence_Components);
+    for (aafUInt32 at = 0; at < count; ++at) {
+        auto* const part = dynamic_cast<Segment*>(ComponentAt(at));
+        if (part == nullptr) {
+            return AAFRESULT_TIMECODE_NOT_FOUND;
+        }
+        aafFrameOffset_t inside = 0;
+        result = part->SegmentTCToOffset(timecode, editRate, &inside);
+        if (result >= 0) {
+            *offset = Plus(start, inside);
+            return result;
+        }
+        start = Plus(start, LengthOf(*part));
+    }
+    return result;
 }
 
 }  // namespace aaf

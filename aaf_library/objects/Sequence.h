@@ -33,6 +33,11 @@ public:
     }
     HRESULT GetComponents(IEnumAAFComponents** enumerator) override;
 
+    // -- IAAFSegment: of the component at the offset, or the first that has the timecode
+    HRESULT SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) override;
+    HRESULT SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
+                              aafFrameOffset_t* offset) override;
+
 private:
     // Whether a component of this data definition may stand in the sequence.
     HRESULT CheckDataDefinition(Component& component);

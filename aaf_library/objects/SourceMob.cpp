@@ -7,6 +7,11 @@
 #include "aaf_library/model/Model.h"
 #include "aaf_library/objects/Checks.h"
 #include "aaf_library/objects/EssenceDescriptor.h"
+#include "aaf_library/objects/MobSlot.h"
+#include "aaf_library/objects/OtherComponents.h"
+#include "aaf_library/objects/Rates.h"
+#include "aaf_library/objects/Sequence.h"
+#include "aaf_library/objects/SourceSearch.h"
 #include "aaf_library/objects/Timecode.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
@@ -87,6 +92,79 @@ HRESULT SourceMob::AppendPhysSourceRef(aafRational_t editrate, aafSlotID_t aMobS
                                        IAAFDataDef* essenceKind, aafSourceRef_t ref,
                                        aafLength_t srcRefLength) {
     return AppendSourceClip(editrate, aMobSlot, essenceKind, ref, srcRefLength);
+}
+
+HRESULT SourceMob::AddPulldownRef(aafAppendOption_t addType, aafRational_t editrate,
+                                  aafSlotID_t aMobSlot, IAAFDataDef* essenceKind,
+                                  aafSourceRef_t ref, aafLength_t srcRefLength,
+                                  aafPulldownKind_t pulldownKind, aafPhaseFrame_t phaseFrame,
+                                  aafPulldownDir_t direction) {
+    if (!IsWithin(addType, kAAFAppend, kAAFForceOverwrite) ||
+        !IsWithin(pulldownKind, kAAFTwoThreePD, kAAFTwoToOnePD) ||
+        !IsWithin(direction, kAAFTapeToFilmSpeed, kAAFFilmToTapeSpeed)) {
+        return AAFRESULT_INVALID_ENUM_VALUE;
+    }
+    if (srcRefLength < 0) {
+        return AAFRESULT_BAD_LENGTH;
+    }
+    RefPtr<Object> clip;
+    const HRESULT result = MakeSourceClip(essenceKind, ref, srcRefLength, clip);
+    if (result < 0) {
+        return result;
+    }
+    const RefPtr<Pulldown> pulldown = model()->NewObject<Pulldown>(AUID_AAFPulldown);
+    pulldown->PutWeak(prop::Component_DataDefinition,
+                      clip->WeakTarget(prop::Component_DataDefinition)->Identity());
+    pulldown->SetLength(PulldownRatioOf(pulldownKind, direction).ToOwn(srcRefLength));
+    pulldown->PutObject(prop::Pulldown_InputSegment, clip->Identity());
+    pulldown->SetPulldownKind(pulldownKind);
+    pulldown->SetPulldownDirection(direction);
+    pulldown->SetPhaseFrame(phaseFrame);
+    MobSlot* const slot = FindSlot(aMobSlot);
+    return addType == kAAFForceOverwrite && slot != nullptr
+               ? slot->PutObject(prop::MobSlot_Segment, pulldown->Identity())
+               : AppendToSequence(editrate, aMobSlot, *pulldown, L"ASlot");
+}
+
+HRESULT SourceMob::SpecifyValidCodeRange(IAAFDataDef* essenceKind, aafSlotID_t slotID,
+                                         aafRational_t editrate, aafFrameOffset_t startOffset,
+                                         aafFrameLength_t length32) {
+    if (essenceKind == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    if (MobKind() != kAAFTapeMob && MobKind() != kAAFFilmMob) {
+        return AAFRESULT_TAPE_DESC_ONLY;
+    }
+    if (editrate.denominator == 0) {
+        return AAFRESULT_BADRATE;
+    }
+    if (length32 < 0) {
+        return AAFRESULT_BAD_LENGTH;
+    }
+    const RefPtr<Sequence> sequence = model()->NewObject<Sequence>(AUID_AAFSequence);
+    const RefPtr<Filler> before = model()->NewObject<Filler>(AUID_AAFFiller);
+    RefPtr<Object> clip;
+    HRESULT result = MakeSourceClip(essenceKind, aafSourceRef_t{}, length32, clip);
+    if (result >= 0) {
+        result = sequence->Initialize(essenceKind);
+    }
+    if (result >= 0) {
+        result = before->Initialize(essenceKind, startOffset);
+    }
+    if (result >= 0 && startOffset > 0) {
+        result = sequence->AppendComponent(before.get());
+    }
+    if (result >= 0) {
+        result = sequence->AppendComponent(static_cast<Component*>(clip.get()));
+    }
+    return result < 0 ? result : AppendTimelineSlot(editrate, *sequence, slotID, L"ASlot");
+}
+
+HRESULT SourceMob::SearchSource(aafSlotID_t slotID, aafPosition_t offset, aafMobKind_t mobKind,
+                                aafMediaCriteria_t* mediaCrit,
+                                aafOperationChoice_t* operationChoice,
+                                IAAFFindSourceInfo** sourceInfo) {
+    return SearchSourceOf(*this, slotID, offset, mobKind, mediaCrit, operationChoice, sourceInfo);
 }
 
 }  // namespace aaf

@@ -31,6 +31,22 @@ public:
     HRESULT AppendPhysSourceRef(aafRational_t editrate, aafSlotID_t aMobSlot,
                                 IAAFDataDef* essenceKind, aafSourceRef_t ref,
                                 aafLength_t srcRefLength) override;
+    // A pulldown over a clip of that length: into the sequence of the slot, or in place of what is
+    // there. It is as long as the clip becomes.
+    HRESULT AddPulldownRef(aafAppendOption_t addType, aafRational_t editrate, aafSlotID_t aMobSlot,
+                           IAAFDataDef* essenceKind, aafSourceRef_t ref, aafLength_t srcRefLength,
+                           aafPulldownKind_t pulldownKind, aafPhaseFrame_t phaseFrame,
+                           aafPulldownDir_t direction) override;
+    // A slot of a tape or film whose code is valid over that range: nothing up to its start, then a
+    // clip that ends the chain.
+    HRESULT SpecifyValidCodeRange(IAAFDataDef* essenceKind, aafSlotID_t slotID,
+                                  aafRational_t editrate, aafFrameOffset_t startOffset,
+                                  aafFrameLength_t length32) override;
+
+    // -- IAAFSearchSource
+    HRESULT SearchSource(aafSlotID_t slotID, aafPosition_t offset, aafMobKind_t mobKind,
+                         aafMediaCriteria_t* mediaCrit, aafOperationChoice_t* operationChoice,
+                         IAAFFindSourceInfo** sourceInfo) override;
 };
 
 }  // namespace aaf

@@ -6,6 +6,7 @@
 
 #include "aaf_library/model/Model.h"
 #include "aaf_library/objects/Checks.h"
+#include "aaf_library/objects/Rates.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 
@@ -87,6 +88,32 @@ HRESULT Timecode::SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timeco
         return AAFRESULT_INVALID_PARAM;
     }
     timecode->startFrame = sum;
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT Timecode::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
+                                    aafFrameOffset_t* offset) {
+    if (timecode == nullptr || editRate == nullptr || offset == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    aafTimecode_t own{};
+    if (const HRESULT result = GetTimecode(&own); result < 0) {
+        return result;
+    }
+    const aafInt64 nominal = NominalFrames(*editRate);
+    if (nominal == 0) {
+        return AAFRESULT_BADRATE;
+    }
+    if (timecode->fps != own.fps || timecode->drop != own.drop || own.fps == 0) {
+        return AAFRESULT_INVALID_TIMECODE;
+    }
+    aafFrameOffset_t frames = 0;
+    if (__builtin_sub_overflow(timecode->startFrame, own.startFrame, &frames) || frames < 0 ||
+        frames >= IntegerOr(prop::Component_Length, 0)) {
+        return AAFRESULT_BADSAMPLEOFFSET;
+    }
+    // A count of 30 in a slot of 29.97 still is one to one.
+    *offset = nominal == own.fps ? frames : Rescaled(frames, {own.fps, 1}, *editRate);
     return AAFRESULT_SUCCESS;
 }
 

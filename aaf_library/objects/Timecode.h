@@ -16,6 +16,10 @@ public:
     HRESULT SetTimecode(aafTimecode_t* timecode) override;
 
     HRESULT SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) override;
+    // The offset of a timecode of the same count, in edit units of that rate. Outside the segment:
+    // AAFRESULT_BADSAMPLEOFFSET.
+    HRESULT SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
+                              aafFrameOffset_t* offset) override;
 
 private:
     bool IsInitialized() const { return IsPresent(prop::Timecode_Start); }

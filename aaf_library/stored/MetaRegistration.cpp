@@ -34,7 +34,8 @@ void CheckLine(int depth) {
 
 }  // namespace
 
-MetaRegistration::MetaRegistration(const MetaRecords& records, Model& model) : model_(model) {
+MetaRegistration::MetaRegistration(const MetaRecords& records, Model& model, Words words)
+    : model_(model), words_(words) {
     for (const MetaClass& record : records.classes) {
         classes_.emplace(record.id, &record);
         for (const MetaProperty& property : record.properties) {
@@ -114,7 +115,9 @@ TypeDefinition* MetaRegistration::EnterType(const GUID& id, int depth) {
     if (!RefersToClass(record.kind) && TargetPidOf(record.kind) != 0) {
         EnterType(record.target, depth + 1);
     }
-    if (!Redefine(*known, model_, record)) {
+    const bool taken =
+        words_ == Words::OfTheFile ? Redefine(*known, model_, record) : AddMembers(*known, record);
+    if (!taken) {
         notes_.push_back("the type " + ToUtf8(record.name) +
                          " is of another kind than elsewhere, which counts");
     }

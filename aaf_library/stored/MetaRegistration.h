@@ -24,8 +24,12 @@ namespace aaf::stored {
 // that is renamed) counts for that model. The records must outlive it.
 class MetaRegistration {
 public:
+    // Whose definitions of types that the model has already: those of the file that the model is
+    // read from, which count, or of another one, which only adds to them.
+    enum class Words { OfTheFile, OfAnother };
+
     // Throws StoredError.
-    MetaRegistration(const MetaRecords& records, Model& model);
+    MetaRegistration(const MetaRecords& records, Model& model, Words words = Words::OfTheFile);
 
     // The model's definition of what the file calls `pid` in objects of that
     // class; null when neither file nor model defines it.
@@ -41,6 +45,7 @@ private:
     void EnterProperties();
 
     Model& model_;
+    Words words_;
     std::unordered_map<GUID, const MetaClass*, GuidHash> classes_;
     std::unordered_map<GUID, const TypeFacts*, GuidHash> types_;
     std::unordered_set<GUID, GuidHash> begun_;

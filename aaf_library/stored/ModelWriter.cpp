@@ -91,6 +91,7 @@ private:
         std::set<Bytes>* targets = nullptr;  // weak forms: what references to that set lead to
         bool carriesType = false;
         bool isSetOfParameters = false;
+        bool namesParameter = false;
     };
     // What all objects of a class have in common.
     struct ClassFacts {
@@ -170,6 +171,7 @@ private:
         const TypeKind kind = definition.type()->Resolved().kind();
         made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
         made.isSetOfParameters = definition.id() == prop::OperationGroup_Parameters.id;
+        made.namesParameter = definition.id() == prop::Parameter_Definition.id;
         return made;
     }
 
@@ -272,6 +274,9 @@ private:
         switch (out.form) {
             case StoredForm::Data:
                 NoteCarriedType(facts, value);
+                if (facts.namesParameter && value.model() != &model_) {
+                    model_.CopyParameterNamedBy(value);
+                }
                 out.bytes = value.bytes();
                 break;
             case StoredForm::Stream:

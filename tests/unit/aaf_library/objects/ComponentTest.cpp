@@ -325,8 +325,6 @@ TEST_F(Component, OfOtherProgramsKeepsItsParts) {
     EXPECT_EQ(1u, Get(group, &IAAFOperationGroup::CountSourceSegments));
     EXPECT_EQ(AAFRESULT_SUCCESS, group->AddParameter(Make<IAAFParameter>(AUID_AAFConstantValue)));
     EXPECT_EQ(1u, Get(group, &IAAFOperationGroup::CountParameters));
-    aafBoolean_t warp = kAAFFalse;
-    EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED, group->IsATimeWarp(&warp));
 
     Ptr<IAAFTransition> transition = Make<IAAFTransition>(AUID_AAFTransition);
     ASSERT_EQ(AAFRESULT_SUCCESS, transition->SetOperationGroup(group));

@@ -3,9 +3,12 @@
 
 // Files as other programs write them: our own, saved and changed.
 
+#include <algorithm>
+#include <cstring>
 #include <functional>
 
 #include "aaf_library/model/PropertyKeys.h"
+#include "aaf_library/stored/MetaPids.h"
 #include "aaf_library/stored/StoredFile.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
@@ -17,6 +20,7 @@
 
 namespace aaf_test {
 
+using aaf::stored::Bytes;
 using aaf::stored::StoredForm;
 using aaf::stored::StoredObject;
 using aaf::stored::StoredProperty;
@@ -51,6 +55,12 @@ StoredProperty& PropertyIn(StoredObject& object, aaf::PropertyId pid) {
     throw std::logic_error("no such property");
 }
 
+Bytes StoredIdOf(const aafUID_t& id) {
+    Bytes bytes(sizeof id);
+    std::memcpy(bytes.data(), &id, sizeof id);
+    return bytes;
+}
+
 StoredProperty& Mobs(StoredObject& root) {
     StoredObject& header = root.properties.at(1).objects.at(0);
     StoredObject& content = PropertyIn(header, prop::Header_Content.pid).objects.at(0);
@@ -82,6 +92,17 @@ protected:
         Ptr<IAAFFile> target = NewFile(name);
         ASSERT_EQ(AAFRESULT_SUCCESS, source->SaveCopyAs(target));
         ASSERT_EQ(AAFRESULT_SUCCESS, target->Close());
+    }
+    // The first mob and those that it refers to.
+    void Clone(IAAFFile* source, const char* name) {
+        Ptr<IAAFFile> target = NewFile(name);
+        Ptr<IAAFHeader> header;
+        ASSERT_EQ(AAFRESULT_SUCCESS, source->GetHeader(header.Out()));
+        Ptr<IAAFMob> mob = Get(header, &IAAFHeader::LookupMob, MobId(0x01));
+        Ptr<IAAFMob> clone;
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  mob->CloneExternal(kAAFFollowDepend, kAAFIncludeMedia, target, clone.Out()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, target->Save());
     }
     StoredObject Tree(const char* name) {
         StoredObject root;
@@ -166,6 +187,54 @@ TEST_F(ForeignFile, KeepsOddPropertiesTellsThemAndWritesThemBack) {
                          prop::TimelineMobSlot_EditRate.pid),
               PropertyIn(PropertyIn(Mobs(cloned).objects[0], prop::Mob_Slots.pid).objects[0],
                          prop::TimelineMobSlot_EditRate.pid));
+}
+
+// In the copy the type has its usual width again, and so have the values.
+TEST_F(ForeignFile, MayHaveShorterLengths) {
+    namespace meta = aaf::stored::meta;
+    StoredObject root = Tree("ours.aaf");
+    const auto longer = StoredIdOf(kAAFTypeID_Int64);
+    const auto shorter = StoredIdOf(kAAFTypeID_Int32);
+    StoredObject& definitions = root.properties.at(0).objects.at(0);
+    const auto own = StoredIdOf(kAAFTypeID_LengthType);
+    const auto renamed = [&](StoredObject& dictionary) -> Bytes& {
+        StoredProperty& types = PropertyIn(dictionary, meta::kTypeDefinitions);
+        const auto at = std::find(types.keys.begin(), types.keys.end(), own);
+        StoredObject& type = types.objects.at(static_cast<std::size_t>(at - types.keys.begin()));
+        return PropertyIn(type, meta::kRenamedType).keys.at(0);
+    };
+    renamed(definitions) = shorter;
+    std::size_t shortened = 0;
+    const std::function<void(StoredObject&)> shorten = [&](StoredObject& object) {
+        for (StoredProperty& property : object.properties) {
+            if (property.pid == prop::Component_Length.pid ||
+                property.pid == prop::FileDescriptor_Length.pid) {
+                property.bytes.resize(4);
+                ++shortened;
+            }
+            std::for_each(property.objects.begin(), property.objects.end(), shorten);
+        }
+    };
+    StoredProperty& mobs = Mobs(root);
+    std::for_each(mobs.objects.begin(), mobs.objects.end(), shorten);
+    EXPECT_LT(3u, shortened);
+    WriteTree(root, "short.aaf");
+    const Sentences told;
+    Ptr<IAAFFile> read = Open("short.aaf");
+    EXPECT_EQ(std::vector<std::wstring>(), told.all);
+    Ptr<IAAFFile> whole = Open("ours.aaf");
+    SaveAs(read, "copy.aaf");
+    SaveAs(whole, "whole copy.aaf");
+    StoredObject copied = Tree("copy.aaf");
+    StoredObject expected = Tree("whole copy.aaf");
+    EXPECT_EQ(longer, renamed(copied.properties.at(0).objects.at(0)));
+    EXPECT_EQ(Mobs(expected), Mobs(copied));
+    // The same by way of copies in memory.
+    Clone(read, "clone.aaf");
+    Clone(whole, "whole clone.aaf");
+    StoredObject cloned = Tree("clone.aaf");
+    expected = Tree("whole clone.aaf");
+    EXPECT_EQ(Mobs(expected), Mobs(cloned));
 }
 
 TEST_F(ForeignFile, ShowsAnOddPropertyAsBytesOfNoDefinedType) {

@@ -405,12 +405,8 @@ TEST_F(Mob, OfACompositionHasDefaultFades) {
 
 TEST_F(Mob, AnswersNotImplementedToAccessOfEssence) {
     Ptr<IAAFMasterMob> master = Make<IAAFMasterMob>(AUID_AAFMasterMob);
-    Ptr<IAAFSearchSource> search = As<IAAFSearchSource>(master);
-    Ptr<IAAFFindSourceInfo> info;
     aafUInt16 channels = 0;
     EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED, master->CountChannels(1, nullptr, nullptr, &channels));
-    EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED,
-              search->SearchSource(1, 0, kAAFFileMob, nullptr, nullptr, info.Out()));
 }
 
 }  // namespace aaf_test

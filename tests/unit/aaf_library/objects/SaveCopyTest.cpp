@@ -122,6 +122,34 @@ TEST_F(SaveCopy, CarriesExtensionsThatNothingUses) {
     EXPECT_EQ(kAAFTrue, Get(property, &IAAFPropertyDef::GetIsOptional));
 }
 
+// Both files have added a use of mobs under one name.
+TEST_F(SaveCopy, LeavesTheTargetItsOwnMembersOfAnEnumeration) {
+    const aafUID_t ours = ncfGuid("ABCDEF00-0000-0000-0000-000000000006");
+    const aafUID_t theirs = ncfGuid("ABCDEF00-0000-0000-0000-000000000007");
+    const aafUID_t other = ncfGuid("ABCDEF00-0000-0000-0000-000000000008");
+    const auto uses = [](IAAFDictionary* dictionary) {
+        return As<IAAFTypeDefExtEnum>(
+            Get(dictionary, &IAAFDictionary::LookupTypeDef, kAAFTypeID_UsageType));
+    };
+    Ptr<IAAFTypeDefExtEnum> source = uses(dictionary_);
+    ASSERT_EQ(AAFRESULT_SUCCESS, source->AppendElement(ours, L"Usage_Own"));
+    ASSERT_EQ(AAFRESULT_SUCCESS, source->AppendElement(other, L"Usage_Other"));
+    Ptr<IAAFFile> target = NewFile(Path("uses.aaf"));
+    {
+        Ptr<IAAFDictionary> dictionary = Get(target, &IAAFFile::GetDictionary);
+        ASSERT_EQ(AAFRESULT_SUCCESS, uses(dictionary)->AppendElement(theirs, L"Usage_Own"));
+    }
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target));
+    Ptr<IAAFDictionary> dictionary = Get(target, &IAAFFile::GetDictionary);
+    Ptr<IAAFTypeDefExtEnum> joined = uses(dictionary);
+    aafCharacter name[20] = {};
+    EXPECT_EQ(AAFRESULT_SUCCESS, joined->GetNameFromAUID(theirs, name, sizeof name));
+    EXPECT_EQ(std::wstring(L"Usage_Own"), name);
+    EXPECT_EQ(AAFRESULT_SUCCESS, joined->GetNameFromAUID(other, name, sizeof name));
+    EXPECT_EQ(std::wstring(L"Usage_Other"), name);
+    EXPECT_GT(0, joined->GetNameFromAUID(ours, name, sizeof name));
+}
+
 TEST_F(SaveCopy, GivesEqualFilesOfEqualClipsWhileTimeIsPinned) {
     const aafTimeStamp_t time{{2026, 1, 2}, {3, 4, 5, 0}};
     const aafUID_t generation = ncfGuid("ABCDEF00-0000-0000-0000-000000000005");
