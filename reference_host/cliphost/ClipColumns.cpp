@@ -24,6 +24,7 @@
 #include "reference_host/cliphost/AafValue.h"
 #include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/TimecodeText.h"
 #include "reference_host/cliphost/Words.h"
 #include "text/Encodings.h"
 
@@ -230,7 +231,7 @@ private:
         if (!timecode || timecode->GetTimecode(&counted) < 0) {
             Refuse(kExitFile, "the description has no timecode");
         }
-        const TimecodeText time = ReadTimecode(value_->text).value_or(TimecodeText());
+        const WrittenTimecode time = ReadTimecode(value_->text).value_or(WrittenTimecode());
         const std::optional<std::int64_t> frames = FramesOf(time, counted.fps);
         if (!frames) {
             Refuse(kExitCaller, fmt::format("'{}' is no timecode at {} frames a second",
@@ -356,7 +357,7 @@ std::string StartOf(const Mobs& mobs) {
     // Two timecodes that begin with 0 are those of a movie without one of its own.
     const bool isMadeUp = source.startTime == 0 && mobs.CountTimecodes() > 1;
     return timecode && timecode->GetTimecode(&counted) >= 0 && !isMadeUp
-               ? TimecodeOf(source.startTime, counted.fps, counted.drop == kAAFTcDrop)
+               ? TimecodeText(source.startTime, counted.fps, counted.drop == kAAFTcDrop)
                : std::string();
 }
 

@@ -6,9 +6,9 @@
 
 #include <algorithm>
 
-#include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/TimecodeText.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/util/text/FileUrl.h"
 
@@ -39,76 +39,7 @@ std::string FullPath(const std::string& path) {
     return (error ? std::filesystem::path(path) : full).lexically_normal().native();
 }
 
-bool IsDropRate(unsigned fps) {
-    return fps != 0 && fps % 30 == 0;
-}
-
-// Frame numbers that each minute but every tenth begins without.
-unsigned DroppedPerMinute(unsigned fps) {
-    return IsDropRate(fps) ? fps / 15 : 0;
-}
-
 }  // namespace
-
-std::optional<TimecodeText> ReadTimecode(std::string_view text) {
-    constexpr std::string_view kForm = "00:00:00:00";
-    if (text.size() < kForm.size() || text.size() > kForm.size() + 1) {
-        return std::nullopt;
-    }
-    const char last = text[8];
-    for (std::size_t i = 0; i < text.size(); ++i) {
-        const bool isDigit = text[i] >= '0' && text[i] <= '9';
-        if (i == 8                                ? last != ':' && last != ';' && last != '.'
-            : i < kForm.size() && kForm[i] == ':' ? text[i] != ':'
-                                                  : !isDigit) {
-            return std::nullopt;
-        }
-    }
-    const auto number = [&](std::size_t at, std::size_t size) {
-        unsigned value = 0;
-        for (const char digit : text.substr(at, size)) {
-            value = value * 10 + static_cast<unsigned>(digit - '0');
-        }
-        return value;
-    };
-    const TimecodeText time{number(0, 2), number(3, 2), number(6, 2), number(9, 3), last != ':'};
-    if (time.hours > 23 || time.minutes > 59 || time.seconds > 59) {
-        return std::nullopt;
-    }
-    return time;
-}
-
-std::optional<std::int64_t> FramesOf(const TimecodeText& time, unsigned fps) {
-    const bool isLeftOut = time.drops && time.minutes % 10 != 0 && time.seconds == 0 &&
-                           time.frames < DroppedPerMinute(fps);
-    ncfUInt32 frames = 0;
-    if (time.frames >= fps || (time.drops && !IsDropRate(fps)) || isLeftOut ||
-        ConvertTCToFrames(time.hours, time.minutes, time.seconds, time.frames, fps, time.drops,
-                          &frames) < 0) {
-        return std::nullopt;
-    }
-    return frames;
-}
-
-std::string TimecodeOf(std::int64_t frames, unsigned fps, bool drops) {
-    if (fps == 0 || frames < 0) {
-        return {};
-    }
-    drops = drops && IsDropRate(fps);
-    const std::int64_t dropped = drops ? DroppedPerMinute(fps) : 0;
-    const std::int64_t inMinute = std::int64_t{fps} * 60 - dropped;
-    const std::int64_t inTen = inMinute * 10 + dropped;
-    frames %= inTen * 6 * 24;
-    if (drops) {
-        const std::int64_t rest = frames % inTen;
-        const std::int64_t minutes =
-            rest < std::int64_t{fps} * 60 ? 0 : (rest - dropped) / inMinute;
-        frames += dropped * (9 * (frames / inTen) + minutes);
-    }
-    const std::int64_t seconds = frames / fps;
-    return fmt::format("{:02}:{:02}:{:02}{}{:02}", seconds / 3600 % 24, seconds / 60 % 60,
-                       seconds % 60, drops ? ';' : ':', frames % fps);
-}
 
 ColumnUse UseOf(std::string_view name) {
     const std::string small = InSmallLetters(std::string(name));

@@ -12,17 +12,6 @@
 
 namespace cliphost {
 
-// A time as HH:MM:SS:FF; with a semicolon or a point before the frames they are counted with drops.
-struct TimecodeText {
-    unsigned hours = 0, minutes = 0, seconds = 0, frames = 0;
-    bool drops = false;
-};
-std::optional<TimecodeText> ReadTimecode(std::string_view text);
-// The frames from midnight; none for a time that is not counted at that rate.
-std::optional<std::int64_t> FramesOf(const TimecodeText& time, unsigned fps);
-// The other way, within a day. A rate of 0 gives no text.
-std::string TimecodeOf(std::int64_t frames, unsigned fps, bool drops);
-
 // What a column of a table of movies is for.
 enum class ColumnUse { Path, Name, Reel, Start, PassedOver, Comment };
 // By its name in any case; what has no use of its own is a column of the bin.

@@ -10,11 +10,6 @@ using namespace cliphost;
 
 namespace {
 
-std::int64_t Frames(const char* text, unsigned fps) {
-    const auto time = ReadTimecode(text);
-    return time ? FramesOf(*time, fps).value_or(-1) : -2;
-}
-
 std::uint64_t RowOf(const MovieColumns& columns, const char* movie) {
     const MovieColumns::Row* const row = columns.Find(movie);
     return row ? row->number : 0;
@@ -28,46 +23,6 @@ void ExpectRefused(std::string_view text, const std::string& words) {
         EXPECT_EQ(failure.status(), kExitCaller);
         EXPECT_NE(std::string(failure.what()).find(words), std::string::npos) << failure.what();
     }
-}
-
-TEST(TimecodeText, IsReadInItsForm) {
-    EXPECT_EQ(Frames("01:00:00:00", 25), 90000);
-    EXPECT_EQ(Frames("23:59:59:24", 25), 86400 * 25 - 1);
-    EXPECT_EQ(Frames("01:00:00;00", 30), 107892);
-    EXPECT_EQ(Frames("01:00:00.02", 30), 107894);
-    EXPECT_EQ(Frames("00:00:01:100", 120), 220);
-    for (const char* const wrong :
-         {"", "1:00:00:00", "01:00:00", "24:00:00:00", "00:60:00:00", "00:00:60:00", "00:00:00:0a",
-          "00-00:00:00", "00:00;00:00", "+1:00:00:00", "01:00:00:0000", "01:00:00:00 "}) {
-        EXPECT_EQ(Frames(wrong, 25), -2) << wrong;
-    }
-}
-
-TEST(TimecodeText, IsCountedAtTheRate) {
-    EXPECT_EQ(Frames("00:00:00:25", 25), -1);
-    EXPECT_EQ(Frames("00:00:00;10", 25), -1);  // nothing drops at 25
-    EXPECT_EQ(Frames("00:01:00;00", 30), -1);  // left out
-    EXPECT_EQ(Frames("00:01:00;01", 30), -1);
-    EXPECT_EQ(Frames("00:01:00;02", 30), 1800);
-    EXPECT_EQ(Frames("00:10:00;00", 30), 17982);
-    EXPECT_EQ(Frames("00:01:00;03", 60), -1);
-    EXPECT_EQ(Frames("00:01:00;04", 60), 3600);
-    EXPECT_EQ(Frames("00:00:00:00", 0), -1);
-}
-
-TEST(TimecodeText, GoesBothWays) {
-    for (const unsigned fps : {24u, 25u, 30u, 60u, 120u}) {
-        for (const bool drops : {false, fps % 30 == 0}) {
-            for (std::int64_t frames = 0; frames < 86000 * fps; frames += 997) {
-                const std::string text = TimecodeOf(frames, fps, drops);
-                ASSERT_EQ(Frames(text.c_str(), fps), frames) << text << " at " << fps;
-            }
-        }
-    }
-    EXPECT_EQ(TimecodeOf(90000, 25, true), "01:00:00:00");
-    EXPECT_EQ(TimecodeOf(86400 * 25, 25, false), "00:00:00:00");
-    EXPECT_EQ(TimecodeOf(1, 0, false), "");
-    EXPECT_EQ(TimecodeOf(-1, 25, false), "");
 }
 
 TEST(MovieColumns, FindsByPathThenByName) {
