@@ -61,15 +61,16 @@ private:
     std::vector<std::filesystem::path> found_;
 };
 
+}  // namespace
+
 bool EndsSo(const std::string& name, const std::vector<std::string>& endings) {
+    const std::string small = InSmallLetters(name);
     return std::any_of(endings.begin(), endings.end(), [&](const std::string& ending) {
         const std::size_t size = ending.size() + 1;
-        return name.size() > size && name[name.size() - size] == '.' &&
-               name.compare(name.size() - ending.size(), ending.size(), ending) == 0;
+        return small.size() > size && small[small.size() - size] == '.' &&
+               small.compare(small.size() - ending.size(), ending.size(), ending) == 0;
     });
 }
-
-}  // namespace
 
 std::vector<std::filesystem::path> FoldersIn(const std::filesystem::path& folder) {
     return FolderWalk(folder).TakeFound();
@@ -105,8 +106,7 @@ std::vector<Problem> ForEachByEnding(
     std::filesystem::directory_iterator entry(folder, error);
     for (; !error && entry != std::filesystem::directory_iterator(); entry.increment(error)) {
         std::error_code ignored;
-        if (!EndsSo(InSmallLetters(entry->path().filename().native()), endings) ||
-            entry->is_directory(ignored)) {
+        if (!EndsSo(entry->path().filename().native(), endings) || entry->is_directory(ignored)) {
             continue;
         }
         if (entry->is_regular_file(ignored)) {

@@ -19,6 +19,9 @@ std::vector<std::filesystem::path> FoldersIn(const std::filesystem::path& folder
 // them do not count. Throws a Failure that says what is wrong.
 std::vector<std::string> EndingsIn(const std::string& list);
 
+// Whether a name ends by one of them, in any case.
+bool EndsSo(const std::string& name, const std::vector<std::string>& endings);
+
 // Calls for each file of a folder whose name ends so, in no order. Gives what is no file, such as
 // links that end nowhere and pipes, in the order of names. Throws a Failure for a folder that
 // can't be read.
