@@ -40,6 +40,8 @@ Cflags: -I\${includedir}
 ")
 install(FILES ${PROJECT_BINARY_DIR}/host_interfaces.pc DESTINATION ${CMAKE_INSTALL_DATADIR}/pkgconfig)
 
+install(FILES "cmake/cliphost-watch@.service" DESTINATION lib/systemd/system)
+
 install(FILES LICENSE RENAME copyright DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
 install(FILES README.md DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
 install(DIRECTORY docs DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)

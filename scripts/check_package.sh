@@ -41,6 +41,16 @@ if command -v groff >/dev/null; then
   done
 fi
 
+unit='lib/systemd/system/cliphost-watch@.service'
+[ -s "$root/usr/$unit" ] || fail "$unit is missing"
+if command -v systemd-analyze >/dev/null; then
+  # With the program of the empty root, and without a folder that is to be mounted.
+  sed "s#/usr/bin/cliphost#$program#; /^RequiresMountsFor/d" "$root/usr/$unit" >"$root/cliphost-watch@in.service"
+  said=$(systemd-analyze verify --man=no "$root/cliphost-watch@in.service" 2>&1) || fail "systemd: $said"
+  [ -z "$said" ] || fail "systemd: $said"
+  rm "$root/cliphost-watch@in.service"
+fi
+
 # A header alone, as a module of another maker would have it.
 flags=$(PKG_CONFIG_PATH=$root/usr/share/pkgconfig pkg-config --cflags host_interfaces)
 cd "$root"  # where no other headers are

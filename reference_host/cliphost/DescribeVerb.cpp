@@ -6,7 +6,9 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/Verbs.h"
+#include "reference_host/cliphost/WatchRun.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
 #include "reference_host/system/OutputStream.h"
@@ -67,6 +69,34 @@ void AddDescribeForParent(CLI::App& app, const SessionOptions& session, int& sta
     });
 }
 
+void AddWatchOptions(CLI::App& verb, WatchOptions& watch) {
+    constexpr std::uint64_t kMostSeconds = 86'400;
+    const char* const group = "Folders in which movies arrive";
+    auto* const on =
+        verb.add_flag("--watch", watch.isOn,
+                      "Go on until a signal comes: describe each movie that arrives in the "
+                      "folders, after those that are there. Those count whose names end in .mov, "
+                      "or as --extensions says")
+            ->group(group)
+            ->needs("--out-dir");
+    for (const char* const other :
+         {"--aaf", "--bin", "--columns-out", "--files-from", "--json", "--shard"}) {
+        on->excludes(verb.get_option(other));
+    }
+    verb.add_option("--rest", watch.rest,
+                    "A movie has arrived when its size and date did not change for so many seconds")
+        ->check(WholeNumber(1, kMostSeconds))
+        ->default_str("5")
+        ->group(group)
+        ->needs(on);
+    verb.add_option("--poll", watch.poll,
+                    "Look at the folders every so many seconds, instead of being told by the "
+                    "system, which does not know what other machines do in a network's folders")
+        ->check(WholeNumber(1, kMostSeconds))
+        ->group(group)
+        ->needs(on);
+}
+
 }  // namespace
 
 void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
@@ -81,7 +111,9 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost describe FOLDER --bin BIN.aaf --columns LIST.csv\n"
         "  cliphost describe FOLDER --out-dir DIR --recursive --extensions mov,mxf\n"
         "  cliphost describe --files-from LIST --out-dir DIR --skip-done --jsonl\n"
-        "  cliphost describe --files-from LIST --out-dir DIR --shard 2/16");
+        "  cliphost describe --files-from LIST --out-dir DIR --shard 2/16\n"
+        "  cliphost describe --watch FOLDER --recursive --out-dir DIR --skip-done\n"
+        "  cliphost describe --watch /mnt/nas/in --poll 30 --out-dir DIR");
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
     auto* const aaf =
@@ -105,8 +137,10 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
     // What was done before is not looked at, so that nothing is known of it.
     verb->get_option("--columns-out")->excludes("--skip-done");
     AddWorkerOptions(*verb, options->movies.workers);
+    auto watch = std::make_shared<WatchOptions>();
+    AddWatchOptions(*verb, *watch);
     AddDescribeForParent(app, session, status);
-    verb->callback([&app, verb, &session, &status, options, pinned] {
+    verb->callback([&app, verb, &session, &status, options, pinned, watch] {
         NeedInputs(options->movies);
         options->form.json = options->form.json || options->form.lines;
         const auto work = [&] {
@@ -132,7 +166,12 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             options->editorRate = session.host.editorFrameRate.value_or(options->editorRate);
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));
-            status = DescribeRun(running, *options).Run();
+            if (watch->isOn) {
+                WatchFolders(running, *options, *watch);
+                status = kExitFine;
+            } else {
+                status = DescribeRun(running, *options).Run();
+            }
         };
         if (options->form.lines) {
             AnswerFailureInLine(schema::kDescribe, work);

@@ -64,11 +64,11 @@ private:
 }  // namespace
 
 bool HasEnding(const std::filesystem::path& file, const std::vector<std::string>& endings) {
-    const std::string name = InSmallLetters(file.filename().native());
+    const std::string small = InSmallLetters(file.filename().native());
     return std::any_of(endings.begin(), endings.end(), [&](const std::string& ending) {
         const std::size_t size = ending.size() + 1;
-        return name.size() > size && name[name.size() - size] == '.' &&
-               name.compare(name.size() - ending.size(), ending.size(), ending) == 0;
+        return small.size() > size && small[small.size() - size] == '.' &&
+               small.compare(small.size() - ending.size(), ending.size(), ending) == 0;
     });
 }
 

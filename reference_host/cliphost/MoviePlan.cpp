@@ -4,9 +4,6 @@
 
 #include <fmt/format.h>
 
-#include <unordered_map>
-#include <unordered_set>
-
 #include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/Words.h"
 
@@ -36,7 +33,8 @@ public:
           ending_(ending),
           plan_(plan),
           hasNumbers_(!options.outFolder.empty() &&
-                      (options.skipDone || !options.shard.IsWhole())) {}
+                      (options.skipDone || !options.shard.IsWhole() || options.names)),
+          names_(options.names ? *options.names : ownNames_) {}
 
     void Add(const std::filesystem::path& path) {
         std::error_code ignored;
@@ -94,8 +92,15 @@ private:
     }
 
     unsigned NextNumber(const std::filesystem::path& movie) {
-        unsigned& number = lastNumbers_[OutputName(movie, 1, ending_)];
-        while (!names_.insert(OutputName(movie, ++number, ending_)).second) {
+        unsigned* const known = options_.names ? &names_.byMovie[movie.native()] : nullptr;
+        if (known && *known != 0) {
+            return *known;
+        }
+        unsigned& number = names_.lastNumbers[OutputName(movie, 1, ending_)];
+        while (!names_.taken.insert(OutputName(movie, ++number, ending_)).second) {
+        }
+        if (known) {
+            *known = number;
         }
         return number;
     }
@@ -189,8 +194,8 @@ private:
     const char* const ending_;
     MoviePlan& plan_;
     const bool hasNumbers_;
-    std::unordered_set<std::string> names_;                  // of outputs
-    std::unordered_map<std::string, unsigned> lastNumbers_;  // by the name without one
+    OutputNames ownNames_;
+    OutputNames& names_;
     bool isEmpty_ = true;  // the folder has neither a movie nor what is told as one
     bool hasMovies_ = false;
 };

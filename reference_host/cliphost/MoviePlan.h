@@ -6,6 +6,8 @@
 #include <filesystem>
 #include <memory>
 #include <string>
+#include <unordered_map>
+#include <unordered_set>
 #include <vector>
 
 #include "reference_host/cliphost/Failure.h"
@@ -16,6 +18,14 @@
 #include "reference_host/cliphost/Workers.h"
 
 namespace cliphost {
+
+// The names that outputs have, where plans follow each other: a movie that comes again keeps its
+// own.
+struct OutputNames {
+    std::unordered_set<std::string> taken;
+    std::unordered_map<std::string, unsigned> lastNumbers;  // by the name without one
+    std::unordered_map<std::string, unsigned> byMovie;
+};
 
 struct MoviesOptions {
     std::vector<std::filesystem::path> paths;  // movies and folders
@@ -29,6 +39,8 @@ struct MoviesOptions {
     bool skipDone = false;            // leave out what lies there already
     std::filesystem::path together;   // for what is made of all
     WorkerCall workers;               // without `writeNear`
+    bool apart = false;               // even a single movie is read by another process
+    OutputNames* names = nullptr;     // of the plans before; none: this is the only one
 
     bool Saves() const { return !file.empty() || !outFolder.empty(); }
 };

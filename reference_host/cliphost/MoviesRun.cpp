@@ -54,18 +54,50 @@ void MoviesRun::TellAlso(const Failure& failure) {
     TellProblem(failure.problem(), session_.verbosity());
 }
 
-int MoviesRun::Run() {
+void MoviesRun::Begin() {
+    looks_.clear();
+    placesOfRequests_.clear();
+    nextPlace_ = 0;
+    answers_.clear();
+    guarded_.reset();
+    outputs_.clear();
+    countedBefore_ = done_ + doneBefore_ + failed_;
     plan_.emplace(session_, options_, ending_);
+}
+
+// Signals are noted from the plan on; the folder, if the run made it, goes where nothing lies in
+// it.
+struct MoviesRun::Held {
+    std::optional<DelayedSignals> signals;
+    std::optional<OutputFolder> folder;
+};
+
+int MoviesRun::Run() {
+    Held held;
+    DoPlan(held);
+    Finish(done_, failed_);
+    if (isStopped_) {
+        TellStop();
+        std::fflush(stdout);  // the signal may end the program
+    }
+    return status_;
+}
+
+void MoviesRun::RunOnce() {
+    Held held;
+    DoPlan(held);
+}
+
+void MoviesRun::DoPlan(Held& held) {
+    Begin();
     RefuseOneForAllOntoMovie();
     Planned(plan());
     const bool isForWorkers = IsForWorkers();
-    std::optional<DelayedSignals> signals;
     if (isForWorkers || plan().size() > 1) {
-        signals.emplace(isForWorkers ? nullptr : kStopsSoon);
+        held.signals.emplace(isForWorkers ? nullptr : kStopsSoon);
     }
-    std::optional<OutputFolder> folder;
     if (!options_.outFolder.empty()) {
-        folder.emplace(options_.outFolder);
+        held.folder.emplace(options_.outFolder);
     }
     if (LooksFirst()) {
         LookAtMovies();
@@ -75,13 +107,7 @@ int MoviesRun::Run() {
     } else {
         RunHere();
     }
-    isStopped_ = signals && DelayedSignals::HaveCome() && Left() > 0;
-    Finish(done_, failed_);
-    if (isStopped_) {
-        TellStop();
-        std::fflush(stdout);  // the signal may end the program
-    }
-    return status_;
+    isStopped_ = held.signals && DelayedSignals::HaveCome() && Left() > 0;
 }
 
 bool MoviesRun::IsForWorkers() const {
@@ -93,11 +119,12 @@ bool MoviesRun::IsForWorkers() const {
         isOurs = isOurs || host::system::NamesDescriptor(step.movie);
         RefuseDescriptor(options_.workers, step.movie);
     }
-    return options_.workers.limits.AreSet() || (options_.workers.jobs > 1 && movies > 1 && !isOurs);
+    return options_.apart || options_.workers.limits.AreSet() ||
+           (options_.workers.jobs > 1 && movies > 1 && !isOurs);
 }
 
 void MoviesRun::LookAtMovies() {
-    if (options_.skipDone) {
+    if (options_.skipDone && !doneMovies_) {
         doneMovies_.emplace(options_.outFolder, SettingsText(session_, options_.workers.arguments));
         for (const std::filesystem::path& file : doneMovies_->Load()) {
             Notice("cliphost: {}: can't be read; what it tells of is done again\n",
@@ -162,7 +189,7 @@ int MoviesRun::Left() const {
     for (std::size_t i = 0; i < plan().size(); ++i) {
         all += plan()[i].notice ? 0 : 1;
     }
-    return all - done_ - doneBefore_ - failed_;
+    return all - (done_ + doneBefore_ + failed_ - countedBefore_);
 }
 
 void MoviesRun::TellStop() {

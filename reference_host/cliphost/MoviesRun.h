@@ -27,6 +27,13 @@ class MoviesRun : private WorkerClient {
 public:
     virtual ~MoviesRun() = default;
     int Run();
+    // Does what the options name now, which may be others each time, and tells no end. What was
+    // done is counted over all times.
+    void RunOnce();
+    int done() const { return done_; }
+    int failed() const { return failed_; }
+    // How many were left out.
+    int doneBefore() const { return doneBefore_; }
 
 protected:
     // `doing` is shown beside the progress; files in the folder get the ending.
@@ -65,8 +72,7 @@ protected:
         return looks_.empty() ? std::nullopt : looks_[shown_].state;
     }
     const MoviePlan& plan() const { return *plan_; }
-    // For Finish: how many were left out, and whether a signal stopped the run.
-    int doneBefore() const { return doneBefore_; }
+    // For Finish: whether a signal stopped the run.
     bool IsStopped() const { return isStopped_; }
 
     Session& session() { return session_; }
@@ -74,6 +80,9 @@ protected:
     void TellAlso(const Failure& failure);
 
 private:
+    struct Held;
+    void Begin();
+    void DoPlan(Held& held);
     void RefuseOneForAllOntoMovie() const;
     bool IsForWorkers() const;
     // Finds those that are done already, and what all others are before they are read.
@@ -124,6 +133,7 @@ private:
     std::optional<DoneMovies> doneMovies_;
     bool canRecord_ = true;
     std::vector<std::pair<std::uint32_t, std::string>> outputs_;  // of places; for a stop
+    int countedBefore_ = 0;  // of what the options named before
     int doneBefore_ = 0;
     bool isStopped_ = false;
     int done_ = 0;

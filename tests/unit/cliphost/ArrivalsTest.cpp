@@ -1,0 +1,84 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/Arrivals.h"
+
+#include <gtest/gtest.h>
+
+using namespace cliphost;
+using namespace std::chrono_literals;
+
+namespace {
+
+using Paths = std::vector<std::filesystem::path>;
+
+class ArrivalsTest : public testing::Test {
+protected:
+    void Write(const std::string& file, std::uint64_t size, std::int64_t date = 1) {
+        files_[file] = {size, date};
+    }
+    void Remove(const std::string& file) { files_.erase(file); }
+    void See(const std::string& file) { arrivals_.See(file, now_); }
+    Paths TakeAfter(std::chrono::seconds time) { return arrivals_.Take(now_ += time); }
+    Arrivals::Clock::time_point now_{};
+    std::map<std::string, host::system::FileState> files_;
+    Arrivals arrivals_{5s, [this](const std::filesystem::path& file) {
+                           const auto found = files_.find(file.native());
+                           return found == files_.end() ? std::nullopt
+                                                        : std::optional(found->second);
+                       }};
+};
+
+TEST_F(ArrivalsTest, WaitForRest) {
+    Write("b", 1);
+    Write("a", 1);
+    See("b");
+    See("a");
+    EXPECT_EQ(TakeAfter(4s), Paths{});
+    EXPECT_EQ(arrivals_.Next(), Arrivals::Clock::time_point(5s));
+    EXPECT_EQ(TakeAfter(1s), (Paths{"a", "b"}));
+    EXPECT_EQ(TakeAfter(100s), Paths{});
+    EXPECT_EQ(arrivals_.Next(), std::nullopt);
+}
+
+TEST_F(ArrivalsTest, BeginAgainWhileFilesGrow) {
+    Write("a", 1);
+    See("a");
+    Write("a", 2);  // nobody tells
+    EXPECT_EQ(TakeAfter(5s), Paths{});
+    Write("a", 2, 2);
+    now_ += 3s;
+    See("a");  // somebody tells
+    EXPECT_EQ(TakeAfter(4s), Paths{});
+    See("a");  // nothing new
+    EXPECT_EQ(TakeAfter(1s), Paths{"a"});
+}
+
+TEST_F(ArrivalsTest, ComeAgainWhenTheyChange) {
+    Write("a", 1);
+    See("a");
+    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+    See("a");
+    EXPECT_EQ(TakeAfter(5s), Paths{});
+    Write("a", 1, 2);
+    See("a");
+    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+}
+
+TEST_F(ArrivalsTest, MayGoAway) {
+    Write("a", 1);
+    See("a");
+    Remove("a");
+    EXPECT_EQ(TakeAfter(5s), Paths{});
+    See("a");
+    EXPECT_EQ(arrivals_.Next(), std::nullopt);
+    Write("a", 1);
+    See("a");
+    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+    Remove("a");
+    See("a");
+    Write("a", 1);  // as it was
+    See("a");
+    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+}
+
+}  // namespace
