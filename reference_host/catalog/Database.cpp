@@ -4,6 +4,7 @@
 
 #include <sqlite3.h>
 
+#include <cerrno>
 #include <utility>
 
 namespace catalog {
@@ -37,16 +38,19 @@ bool DatabaseError::IsDamaged() const {
     return (code_ & kKindOfCode) == SQLITE_CORRUPT;
 }
 
-bool DatabaseError::IsFull() const {
-    return (code_ & kKindOfCode) == SQLITE_FULL;
-}
-
 bool DatabaseError::IsReadOnly() const {
     return (code_ & kKindOfCode) == SQLITE_READONLY;
 }
 
 bool DatabaseError::CantOpen() const {
     return (code_ & kKindOfCode) == SQLITE_CANTOPEN;
+}
+
+int DatabaseError::SystemError() const {
+    const int kind = code_ & kKindOfCode;
+    return kind == SQLITE_FULL                               ? ENOSPC
+           : kind == SQLITE_IOERR || kind == SQLITE_CANTOPEN ? systemError_
+                                                             : 0;
 }
 
 void Database::Closing::operator()(sqlite3* handle) const {
@@ -79,7 +83,11 @@ void Database::Open(const char* name, int flags) {
 
 void Database::Fail(int code) {
     const std::string words = handle_ ? sqlite3_errmsg(handle_.get()) : sqlite3_errstr(code);
-    throw DatabaseError(handle_ ? sqlite3_extended_errcode(handle_.get()) : code, words);
+    if (!handle_) {
+        throw DatabaseError(code, words);
+    }
+    throw DatabaseError(sqlite3_extended_errcode(handle_.get()), words,
+                        sqlite3_system_errno(handle_.get()));
 }
 
 void Database::Run(const char* sql) {

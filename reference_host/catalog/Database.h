@@ -17,17 +17,20 @@ namespace catalog {
 // What the database library refused, in its words and with its code.
 class DatabaseError : public std::runtime_error {
 public:
-    DatabaseError(int code, const std::string& words) : std::runtime_error(words), code_(code) {}
+    DatabaseError(int code, const std::string& words, int systemError = 0)
+        : std::runtime_error(words), code_(code), systemError_(systemError) {}
 
     bool IsLocked() const;      // somebody else holds it
     bool IsNoDatabase() const;  // the file is of another kind
     bool IsDamaged() const;
-    bool IsFull() const;
     bool IsReadOnly() const;
     bool CantOpen() const;
+    // What the system said of a write or another step; 0 where it said nothing.
+    int SystemError() const;
 
 private:
     int code_;
+    int systemError_;
 };
 
 class Statement;

@@ -170,7 +170,8 @@ std::string PhraseOf(std::string value) {
     }
     std::string phrase = "\"";
     for (const char c : value) {
-        phrase += c == '"' ? std::string("\"\"") : std::string(1, c);
+        // The search ends its texts with a byte of zero.
+        phrase += c == '"' ? std::string("\"\"") : std::string(1, c == '\0' ? ' ' : c);
     }
     return phrase + (isBeginning ? "\"*" : "\"");
 }

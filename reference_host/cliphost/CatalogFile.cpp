@@ -43,16 +43,11 @@ Failure CatalogFailure(const std::filesystem::path& file, const DatabaseError& e
         return {kExitCaller, file, fmt::format("the catalog is damaged: {}", error.what()),
                 "make it anew, without --update"};
     }
-    if (error.IsFull()) {
-        return {kExitCaller, NotWritten(file, ENOSPC)};
-    }
     if (error.IsReadOnly()) {
         return {kExitCaller, NotWritten(file, EACCES)};
     }
-    if (error.CantOpen()) {
-        if (Problem problem = WhyUnreadable(file)) {
-            return {kExitCaller, std::move(problem)};
-        }
+    if (error.SystemError() != 0 && !error.CantOpen()) {
+        return {kExitCaller, NotWritten(file, error.SystemError())};
     }
     return {kExitCaller, file, fmt::format("the database library says: {}", error.what())};
 }
