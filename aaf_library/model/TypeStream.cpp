@@ -221,7 +221,7 @@ HRESULT TypeStream::WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTy
     }
     const HRESULT result =
         TakeElements(streamPropertyValue, elementType, dataSize, &value, &element);
-    if (result < 0) {
+    if (result < 0 || dataSize == 0) {
         return result;
     }
     Bytes stored;

@@ -263,8 +263,8 @@ HRESULT File::SaveCopyAs(IAAFFile* destFile) {
         return result;
     }
     if (target != this && CanSaveContentAs(*target)) {
-        const HRESULT result = CopyExtensions(*model_, *target->model_);
-        if (result < 0 || SaveContentAs(*target)) {
+        HRESULT result = CopyExtensions(*model_, *target->model_);
+        if (result < 0 || SaveContentAs(*target, &result)) {
             return result;
         }
     }
@@ -322,25 +322,31 @@ bool File::CanSaveContentAs(const File& target) const {
            from->HoldsMobsAlone() && !HasRedefinedTypes(*model_);
 }
 
-// Writes the target without a copy of what goes into it. False, and nothing is told, where that
-// fails: the way through a copy then finds out why, and leaves the target as it has to.
-bool File::SaveContentAs(File& target) {
+// Writes the target without a copy of what goes into it. False, and nothing is told, where the
+// content can't be stored: the way through a copy then finds out why, and leaves the target as it
+// has to. A target that only can't be written has its content all the same.
+bool File::SaveContentAs(File& target, HRESULT* result) {
     aafUID_t pattern{};
     if (header_->GetOperationalPattern(&pattern) >= 0) {
         target.header_->SetOperationalPattern(pattern);
     }
     target.header_->Touch();
     const aafUInt32 own = target.header_->IdentificationCount();
-    if (target.header_->AddIdentificationsOf(*header_) < 0 ||
-        !stored::SaveModel(*target.model_, *target.header_, target.path_, target.SizeOfSectors(),
-                           header_->content())) {
+    stored::FileResult saved{stored::FileFailure::NotStorable, {}};
+    if (target.header_->AddIdentificationsOf(*header_) >= 0) {
+        saved = stored::SaveModel(*target.model_, *target.header_, target.path_,
+                                  target.SizeOfSectors(), header_->content());
+    }
+    if (saved.failure == stored::FileFailure::NotStorable ||
+        saved.failure == stored::FileFailure::NoMemory) {
         target.header_->RemoveValue(prop::Header_OperationalPattern);
         target.header_->KeepIdentifications(own);
         return false;
     }
     TellProgress();
+    *result = ResultOf(saved, AAFRESULT_NOT_WRITEABLE);
     TellProgress();
-    target.saved_ = true;
+    target.saved_ = *result >= 0;
     target.AwaitContentOf(*header_);
     return true;
 }

@@ -53,7 +53,7 @@ private:
     HRESULT Load(aafCharacter_constptr path, aafUInt32 modeFlags);
     HRESULT CopyContentTo(File& target);
     bool CanSaveContentAs(const File& target) const;
-    bool SaveContentAs(File& target);
+    bool SaveContentAs(File& target, HRESULT* result);
     // -- Of the file that was saved into.
     void AwaitContentOf(Header& source);
     RefPtr<Header> StopAwaiting();

@@ -18,6 +18,7 @@
 #include "host_interfaces/aaf/AAFTypeIds.h"
 
 #include <set>
+#include <unordered_set>
 
 namespace aaf::stored {
 
@@ -83,6 +84,7 @@ private:
     }
 
     void Fill(Object& object, const StoredObject& from, const GUID& leftOut = {}) {
+        std::unordered_set<PropertyId> met;
         for (const StoredProperty& property : from.properties) {
             const PropertyDefinition* definition =
                 definitions_.property(object.classDefinition(), property.pid);
@@ -96,13 +98,13 @@ private:
                 continue;
             }
             place_.push_back(definition);
-            ReadProperty(object, *definition, property);
+            ReadProperty(object, *definition, property, met.insert(definition->pid()).second);
             place_.pop_back();
         }
     }
 
     void ReadProperty(Object& object, const PropertyDefinition& definition,
-                      const StoredProperty& from) {
+                      const StoredProperty& from, bool isFirst) {
         try {
             if (definition.type() == nullptr) {
                 throw StoredError("has a type that is defined nowhere");
@@ -112,13 +114,16 @@ private:
                 throw StoredError("an object cannot hold it");
             }
         } catch (const StoredError& problem) {
-            KeepAsStored(object, definition, from, problem.what());
+            KeepAsStored(object, definition, from, isFirst, problem.what());
         }
     }
 
+    // In place of what a built-in definition says of itself, but for its id, by which it is found.
+    // Sets of definitions stay too.
     void KeepAsStored(Object& object, const PropertyDefinition& definition,
-                      const StoredProperty& from, const std::string& problem) {
-        if (object.MadeValues().Find(definition.pid()) != nullptr) {
+                      const StoredProperty& from, bool isFirst, const std::string& problem) {
+        const PropertyValue* const present = object.MadeValues().Find(definition.pid());
+        if (present != nullptr && (!isFirst || definition.IsUnique() || present->HoldsObjects())) {
             Note(Place() + problem + "; it is left out");
             return;
         }

@@ -53,6 +53,61 @@ TEST_F(StreamTypes, ByteOrderIsOptional) {
     EXPECT_EQ(type->ClearStoredByteOrder(value.get()), AAFRESULT_SUCCESS);
 }
 
+// A product version takes nine bytes in a file, twelve as a structure.
+TEST_F(StreamTypes, ElementsAreStoredAsTheirTypeStoresThem) {
+    Ptr<IAAFTypeDef> versions = TypeAs<IAAFTypeDef>(kAAFTypeID_ProductVersion);
+    aafProductVersion_t two[2] = {{1, 2, 3, 4, kAAFVersionBeta}, {5, 6, 7, 8, kAAFVersionDebug}};
+    const auto bytes = reinterpret_cast<aafMemPtr_t>(two);
+    ASSERT_EQ(type->WriteElements(value.get(), versions.get(), sizeof two, bytes),
+              AAFRESULT_SUCCESS);
+    EXPECT_EQ(value->bytes().size(), 18u);
+    EXPECT_EQ(value->bytes()[9], 5);
+    ASSERT_EQ(type->AppendElements(value.get(), versions.get(), sizeof *two, bytes),
+              AAFRESULT_SUCCESS);
+    ASSERT_EQ(type->SetPosition(value.get(), 9), AAFRESULT_SUCCESS);
+    aafProductVersion_t read[4] = {};
+    const auto out = reinterpret_cast<aafMemPtr_t>(read);
+    aafUInt32 count = 0;
+    ASSERT_EQ(type->ReadElements(value.get(), versions.get(), sizeof read, out, &count),
+              AAFRESULT_SUCCESS);
+    EXPECT_EQ(count, 2 * sizeof *read);
+    EXPECT_EQ(read[0].patchLevel, 8);
+    EXPECT_EQ(read[0].type, kAAFVersionDebug);
+    EXPECT_EQ(read[1].tertiary, 3);
+    EXPECT_EQ(type->ReadElements(value.get(), versions.get(), sizeof read, out, &count),
+              AAFRESULT_END_OF_DATA);
+    // What is left of an element isn't one.
+    ASSERT_EQ(type->SetPosition(value.get(), 20), AAFRESULT_SUCCESS);
+    EXPECT_EQ(type->ReadElements(value.get(), versions.get(), sizeof read, out, &count),
+              AAFRESULT_END_OF_DATA);
+    EXPECT_EQ(count, 0u);
+}
+
+TEST_F(StreamTypes, ElementsAreWholeAndOfAFixedSize) {
+    Ptr<IAAFTypeDef> numbers = TypeAs<IAAFTypeDef>(kAAFTypeID_Int16);
+    Ptr<IAAFTypeDef> texts = TypeAs<IAAFTypeDef>(kAAFTypeID_String);
+    aafUInt32 count = 0;
+    EXPECT_EQ(type->WriteElements(value.get(), numbers.get(), 3, data), AAFRESULT_BAD_SIZE);
+    EXPECT_EQ(type->AppendElements(value.get(), numbers.get(), 3, data), AAFRESULT_BAD_SIZE);
+    EXPECT_EQ(type->ReadElements(value.get(), numbers.get(), 3, data, &count), AAFRESULT_BAD_SIZE);
+    EXPECT_EQ(type->WriteElements(value.get(), texts.get(), 4, data), AAFRESULT_BAD_TYPE);
+    EXPECT_EQ(type->ReadElements(value.get(), texts.get(), 4, data, &count), AAFRESULT_BAD_TYPE);
+    EXPECT_EQ(type->WriteElements(value.get(), numbers.get(), 0, data), AAFRESULT_SUCCESS);
+    EXPECT_TRUE(value->bytes().empty());
+    EXPECT_EQ(type->WriteElements(value.get(), nullptr, 4, data), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(type->WriteElements(value.get(), numbers.get(), 4, nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(type->AppendElements(value.get(), numbers.get(), 4, nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(type->ReadElements(value.get(), numbers.get(), 4, nullptr, &count),
+              AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(type->ReadElements(value.get(), numbers.get(), 4, data, nullptr),
+              AAFRESULT_NULL_PARAM);
+    ASSERT_EQ(type->SetStoredByteOrder(value.get(), kAAFByteOrderBig), AAFRESULT_SUCCESS);
+    EXPECT_EQ(type->WriteElements(value.get(), numbers.get(), 4, data),
+              AAFRESULT_INVALID_BYTEORDER);
+    EXPECT_EQ(type->ReadElements(value.get(), numbers.get(), 4, data, &count),
+              AAFRESULT_INVALID_BYTEORDER);
+}
+
 TEST_F(StreamTypes, NullArgumentsAreRefused) {
     aafUInt32 count = 0;
     EXPECT_EQ(type->Read(nullptr, 1, data, &count), AAFRESULT_NULL_PARAM);

@@ -290,6 +290,19 @@ TEST_F(TargetOfACopy, HoldsTheMobsWhereItCanNotBeWritten) {
     Ptr<IAAFFile> target = NewFile(Path("no such folder/x.aaf"));
     EXPECT_EQ(AAFRESULT_FILE_NOT_FOUND, file_->SaveCopyAs(target));
     ExpectThreeMobs(target);
+    EXPECT_EQ(AAFRESULT_OPERATION_NOT_PERMITTED, file_->SaveCopyAs(target));
+}
+
+// What can't be written now can be written later, the same as a file that could be.
+TEST_F(TargetOfACopy, CanBeWrittenOnceItsFolderIsThere) {
+    Ptr<IAAFFile> target = NewFile(Path("later/x.aaf"));
+    EXPECT_EQ(AAFRESULT_FILE_NOT_FOUND, file_->SaveCopyAs(target));
+    EXPECT_EQ(AAFRESULT_SUCCESS, master_->SetName(L"later"));
+    std::filesystem::create_directory(folder_ / "later");
+    EXPECT_EQ(AAFRESULT_SUCCESS, target->Save());
+    EXPECT_EQ(AAFRESULT_SUCCESS, master_->SetName(L"A001"));
+    EXPECT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target_));
+    EXPECT_TRUE(Content(Path("later/x.aaf")) == Content(path_));
 }
 
 TEST_F(SaveCopy, NeedsATargetWithoutMobs) {

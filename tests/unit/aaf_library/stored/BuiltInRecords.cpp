@@ -4,6 +4,10 @@
 
 #include <string>
 
+#include "aaf_library/stored/MetaClosure.h"
+#include "aaf_library/stored/MetaPids.h"
+#include "aaf_library/stored/TreeWriter.h"
+
 namespace aaf::stored::sample {
 
 namespace {
@@ -43,6 +47,24 @@ MetaRecords BuiltInRecords() {
         records.types.push_back(record);
     }
     return records;
+}
+
+Bytes FileOfDefinitions(Model& model, StoredObject (*dictionaryOf)(const MetaRecords&)) {
+    MetaClosure closure(model);
+    for (const BuiltInClass& entry : BuiltInClasses()) {
+        closure.AddClass(entry.id);
+    }
+    for (const BuiltInType& entry : BuiltInTypes()) {
+        closure.AddType(entry.id);
+    }
+    StoredProperty property;
+    property.pid = meta::kRootMetaDictionary;
+    property.form = StoredForm::StrongReference;
+    property.name = u"MetaDictionary";
+    property.objects = {dictionaryOf(closure.records())};
+    StoredObject root;
+    root.properties = {property};
+    return WriteTree(root, SectorSize::Bytes512);
 }
 
 }  // namespace aaf::stored::sample

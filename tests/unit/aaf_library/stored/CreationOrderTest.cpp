@@ -16,6 +16,7 @@
 #include "aaf_library/stored/TreeWriter.h"
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
+#include "tests/unit/aaf_library/stored/BuiltInRecords.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
 #include <gtest/gtest.h>
@@ -254,22 +255,7 @@ StoredObject Saved(const sample::SampleModel& sample) {
 
 // All that is built in, as a program would write it.
 StoredObject AllBuiltIn() {
-    const RefPtr<Model> model = sample::NewModel();
-    MetaClosure closure(*model);
-    for (const BuiltInClass& entry : BuiltInClasses()) {
-        closure.AddClass(entry.id);
-    }
-    for (const BuiltInType& entry : BuiltInTypes()) {
-        closure.AddType(entry.id);
-    }
-    StoredProperty property;
-    property.pid = meta::kRootMetaDictionary;
-    property.form = StoredForm::StrongReference;
-    property.name = u"MetaDictionary";
-    property.objects = {StoredMetaDictionary(closure.records())};
-    StoredObject root;
-    root.properties = {property};
-    return ReadTree(WriteTree(root, SectorSize::Bytes512));
+    return ReadTree(sample::FileOfDefinitions(*sample::NewModel(), StoredMetaDictionary));
 }
 
 const StoredObject& Named(const StoredProperty& set, const std::string& name, Bytes& key) {

@@ -593,6 +593,55 @@ TEST(DamagedModel, ASetOfItsOwnInTheDictionaryKeepsItsElements) {
     EXPECT_EQ(passed(tree), ReadTree(WriteTree(tree, SectorSize::Bytes512)));
 }
 
+// Looks at everything in an object in every way that its operations do.
+void LookAt(const Object& object) {
+    for (const auto& [pid, value] : object.values()) {
+        const PropertyKey key = object.classDefinition().FindProperty(pid)->key();
+        std::vector<std::uint8_t> buffer(64);
+        for (const std::size_t bytes : {1, 2, 4, 8, 16, 32, 40}) {
+            object.ReadNative(key, buffer.data(), bytes);
+        }
+        aafUInt32 size = 0;
+        if (object.ReadNativeSize(key, &size) >= 0) {
+            buffer.resize(std::max<std::size_t>(size, 1));
+            object.ReadNative(key, buffer.data(), size);
+        }
+        if (object.ReadIndirectSize(key, &size) >= 0) {
+            buffer.resize(std::max<std::size_t>(size, 1));
+            object.ReadIndirect(key, buffer.data(), size);
+        }
+        aafInt64 number = 0;
+        object.ReadInteger(key, &number);
+        object.StringOr(key, L"");
+        object.WeakTargets(key);
+        for (const RefPtr<Object>& contained : value->objects()) {
+            EXPECT_EQ(contained->owner(), &object);
+            LookAt(*contained);
+        }
+    }
+    object.UniqueKey();
+}
+
+// What a data definition that every model has says of itself counts less than a file's own words,
+// also when they make no sense.
+TEST(DamagedModel, OddPropertiesOfBuiltInDefinitionsAreKept) {
+    StoredObject tree = SampleTree();
+    StoredProperty& set = property(dictionary(tree), prop::Dictionary_DataDefinitions.pid);
+    StoredObject& edgecode = set.objects.at(IndexOf(set, kAAFDataDef_Edgecode));
+    property(edgecode, prop::DefinitionObject_Description.pid).bytes = {'o', 0, 'd'};
+    const Bytes id = property(edgecode, prop::DefinitionObject_Identification.pid).bytes;
+    const sample::SampleModel sample = read(tree);
+    ASSERT_EQ(sample.notes.size(), 1u);
+    EXPECT_NE(sample.notes[0].find("; it is kept as it stands"), std::string::npos);
+    EXPECT_EQ(passed(tree), ReadTree(WriteTree(tree, SectorSize::Bytes512)));
+    // Without its id it would not be found.
+    property(edgecode, prop::DefinitionObject_Identification.pid).bytes.pop_back();
+    StoredObject saved = passed(tree);
+    StoredProperty& again = property(dictionary(saved), prop::Dictionary_DataDefinitions.pid);
+    StoredObject& found = again.objects.at(IndexOf(again, kAAFDataDef_Edgecode));
+    EXPECT_EQ(property(found, prop::DefinitionObject_Identification.pid).bytes, id);
+}
+
 // Every number, key, name and value of the tree changed in turn.
 TEST(DamagedModel, WithARandomChangeIsReadOrRefusedButNeverHarms) {
     const unsigned seed = std::random_device()();
@@ -609,6 +658,7 @@ TEST(DamagedModel, WithARandomChangeIsReadOrRefusedButNeverHarms) {
         try {
             const sample::SampleModel sample = read(ReadTree(damaged));
             odd += sample.notes.empty() ? 0 : 1;
+            LookAt(*sample.header);
             // What was read can be written and read again.
             read(ReadTree(
                 WriteTree(TreeOfModel(*sample.model, *sample.header), SectorSize::Bytes512)));

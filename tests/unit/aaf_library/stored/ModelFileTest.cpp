@@ -19,6 +19,7 @@
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "tests/support/TestFolder.h"
+#include "tests/unit/aaf_library/stored/BuiltInRecords.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
 #include <gtest/gtest.h>
@@ -71,24 +72,6 @@ std::set<std::wstring> StoredClasses(const StoredObject& root) {
 }
 
 // A file of all built-in definitions alone.
-Bytes DefinitionsIn(Model& model, StoredObject (*dictionaryOf)(const MetaRecords&)) {
-    MetaClosure closure(model);
-    for (const BuiltInClass& entry : BuiltInClasses()) {
-        closure.AddClass(entry.id);
-    }
-    for (const BuiltInType& entry : BuiltInTypes()) {
-        closure.AddType(entry.id);
-    }
-    StoredProperty property;
-    property.pid = meta::kRootMetaDictionary;
-    property.form = StoredForm::StrongReference;
-    property.name = u"MetaDictionary";
-    property.objects = {dictionaryOf(closure.records())};
-    StoredObject root;
-    root.properties = {property};
-    return WriteTree(root, SectorSize::Bytes512);
-}
-
 Bytes BytesToSave(const sample::SampleModel& sample, SectorSize size = SectorSize::Bytes512) {
     return WriteTree(TreeToWrite(*sample.model, *sample.header), size);
 }
@@ -119,9 +102,9 @@ TEST(ModelFile, TheBuiltInTablesSayWhatTheDefinitionsSay) {
         EXPECT_FALSE(renamed->HasAsBuiltIn(entry));
     }
     const RefPtr<Model> untouched = sample::NewModel();
-    const Bytes byDefinitions = DefinitionsIn(*renamed, StoredMetaDictionary);
-    EXPECT_EQ(DefinitionsIn(*untouched, StoredMetaDictionary), byDefinitions);
-    EXPECT_EQ(DefinitionsIn(*untouched, LaidOutMetaDictionary), byDefinitions);
+    const Bytes byDefinitions = sample::FileOfDefinitions(*renamed, StoredMetaDictionary);
+    EXPECT_EQ(sample::FileOfDefinitions(*untouched, StoredMetaDictionary), byDefinitions);
+    EXPECT_EQ(sample::FileOfDefinitions(*untouched, LaidOutMetaDictionary), byDefinitions);
 }
 
 TEST(ModelFile, ABuiltInDefinitionThatACallerChangedIsSavedAsItIs) {
@@ -222,6 +205,12 @@ TEST(ModelFile, EverythingComesBackFromTheFile) {
     const sample::SampleModel sample = sample::WholeModel();
     const sample::SampleModel read = reread(BytesOf(sample));
     EXPECT_EQ(TreeOfModel(*read.model, *read.header), TreeOfModel(*sample.model, *sample.header));
+}
+
+TEST(ModelFile, TheHeaderRefersToItsDictionary) {
+    const sample::SampleModel read = reread(BytesOf(sample::WholeModel()));
+    EXPECT_EQ(read.header->ObjectAt(prop::Header_Dictionary), &read.model->dictionary());
+    EXPECT_EQ(read.model->dictionary().owner(), read.header.get());
 }
 
 TEST(ModelFile, TheSameContentGivesTheSameBytes) {
