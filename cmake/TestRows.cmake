@@ -46,9 +46,10 @@ function(is_one_of suite result)
   endforeach()
 endfunction()
 
-# Text for `script`, in the caller's scope.
+# Text for `script`, in the caller's scope. What the filter leaves out is left out of a suite, too.
 macro(add_row row tests)
-  string(APPEND script "add_test([==[${row}]==] [==[${program}]==] [==[--gtest_filter=${tests}]==])\n"
+  string(REGEX MATCH "-.*" left_out "${filter}")
+  string(APPEND script "add_test([==[${row}]==] [==[${program}]==] [==[--gtest_filter=${tests}${left_out}]==])\n"
                        "set_tests_properties([==[${row}]==] PROPERTIES SKIP_RETURN_CODE 77")
   foreach(property IN LISTS properties)
     string(APPEND script " [==[${property}]==]")

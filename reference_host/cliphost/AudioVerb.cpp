@@ -162,7 +162,11 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
         app.add_subcommand("audio", "Write the sound of a track as a WAV file of 24 bits");
     verb->footer(
-        "Example: cliphost audio clip.mov --start 48000 --count 96000 -o piece.wav\n"
+        "Examples:\n"
+        "  cliphost audio clip.mov -o sound.wav\n"
+        "  cliphost audio clip.mov --track 3 -o commentary.wav\n"
+        "  cliphost audio clip.mov --start 48000 --count 96000 -o piece.wav\n"
+        "  cliphost audio clip.mov -o - | flac -o sound.flac -\n\n"
         "A file of more than 4 GiB is written as RF64, which WAV programs read.");
     auto options = std::make_shared<AudioOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();

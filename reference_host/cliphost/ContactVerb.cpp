@@ -74,8 +74,12 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
         app.add_subcommand("contact", "Write contact sheets: thumbnails from the whole movie");
     verb->footer(
-        "Example: cliphost contact clip.mov -o sheet.png\n"
-        "Example: cliphost contact FOLDER --out-dir sheets\n"
+        "Examples:\n"
+        "  cliphost contact clip.mov -o sheet.png\n"
+        "  cliphost contact clip.mov --frames 30 --columns 6 --width 200 --exact -o sheet.png\n"
+        "  cliphost contact FOLDER --out-dir sheets\n"
+        "  cliphost contact FOLDER --out-dir sheets --recursive --extensions mov,mp4 "
+        "--skip-done\n\n"
         "With --use-alpha transparent parts show a checkerboard.");
     auto options = std::make_shared<SheetsOptions>();
     MoviesOptions& movies = options->movies;

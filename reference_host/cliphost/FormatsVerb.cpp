@@ -157,7 +157,11 @@ void Show(Essence& essence, bool json) {
 void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
     auto* const verb = app.add_subcommand(
         "formats", "List the formats in which the module offers each track of a movie");
-    verb->footer("Example: cliphost formats clip.mov --use-alpha");
+    verb->footer(
+        "Examples:\n"
+        "  cliphost formats clip.mov\n"
+        "  cliphost formats clip.mov --use-alpha\n"
+        "  cliphost formats clip.mov --json");
     auto movie = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);
     auto parameters = std::make_shared<ParameterOptions>();

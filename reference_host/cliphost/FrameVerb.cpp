@@ -45,10 +45,13 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
         app.add_subcommand("frame", "Write frames as PNG pictures, or raw for other programs");
     verb->footer(
-        "Example: cliphost frame clip.mov --frame 100 --format deepest -o still.png\n"
-        "Example: cliphost frame clip.mov --range 0: -o - |\n"
-        "           ffplay -f rawvideo -pixel_format uyvy422 -video_size 1920x1080 -framerate 25 "
-        "-i -\n"
+        "Examples:\n"
+        "  cliphost frame clip.mov --frame 100 --format deepest -o still.png\n"
+        "  cliphost frame clip.mov --frame 100 --with-alpha --use-alpha -o title.png\n"
+        "  cliphost frame clip.mov --range 0:250:10 -o stills\n"
+        "  cliphost frame clip.mov --range 0: -o clip.raw\n"
+        "  cliphost frame clip.mov --range 0: -o - |\n"
+        "    ffplay -f rawvideo -pixel_format uyvy422 -video_size 1920x1080 -framerate 25 -i -\n\n"
         "For raw frames, standard error shows pixel format, size and rate.");
     auto options = std::make_shared<FrameOptions>();
     verb->add_option("movie", options->movie, "The movie")->required();

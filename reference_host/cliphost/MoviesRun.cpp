@@ -14,6 +14,7 @@
 #include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/cliphost/WorkerVerb.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/OutputStream.h"
@@ -221,9 +222,11 @@ void MoviesRun::RunHere() {
         }
         GoOnAfterFailure(step.movie, [&] {
             std::filesystem::path saved;
-            const MovieAnswer answer = Answer(step, [&] {
-                saved = options_.Saves() ? TargetFor(i, step) : std::filesystem::path();
-                return saved;
+            const MovieAnswer answer = AnswerOfMovie(step.movie, [&] {
+                return Answer(step, [&] {
+                    saved = options_.Saves() ? TargetFor(i, step) : std::filesystem::path();
+                    return saved;
+                });
             });
             Settle(i, step, answer, options_.together.empty() ? saved : options_.together);
         });

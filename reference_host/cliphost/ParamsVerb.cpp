@@ -103,7 +103,11 @@ void PrintAsJson(const std::filesystem::path& movie, const ShownParameters& show
 void AddParams(CLI::App& app, const SessionOptions& session, int&) {
     auto* const verb = app.add_subcommand("params", "Show and change the parameters of a movie");
     verb->footer(
-        "Example: cliphost params clip.mov --set \"Level Remapping=Expand\" --xml values > my.xml");
+        "Examples:\n"
+        "  cliphost params clip.mov\n"
+        "  cliphost params clip.mov --set \"Level Remapping=Expand\" --xml values > my.xml\n"
+        "  cliphost params clip.mov --set-xml my.xml --json\n"
+        "  cliphost params clip.mov --xml description");
     auto options = std::make_shared<ParamsOptions>();
     verb->add_option("movie", options->movie, "A movie")->required();
     options->parameters.AddTo(*verb);

@@ -63,7 +63,11 @@ nlohmann::ordered_json ToJson(const Session& session) {
 
 void AddPlugin(CLI::App& app, const SessionOptions& options, int&) {
     auto* const verb = app.add_subcommand("plugin", "Show what the module registered");
-    verb->footer("Example: cliphost plugin --json");
+    verb->footer(
+        "Examples:\n"
+        "  cliphost plugin\n"
+        "  cliphost plugin --json\n"
+        "  cliphost plugin --plugin another.nvx");
     auto json = std::make_shared<bool>(false);
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, json] {

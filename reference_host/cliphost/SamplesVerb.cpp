@@ -224,7 +224,10 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb =
         app.add_subcommand("samples", "Show where the samples of a movie are in its file");
     verb->footer(
-        "Example: cliphost samples clip.mov --track 0 --json\n"
+        "Examples:\n"
+        "  cliphost samples clip.mov\n"
+        "  cliphost samples clip.mov --track 0 --json\n"
+        "  cliphost samples clip.mov --every\n\n"
         "Samples are listed in decode order. The offset leads to the sample that is displayed at "
         "this "
         "place:\nso many samples later in the list. Totals that do not agree with "

@@ -107,7 +107,10 @@ int ShowFolder(Session& session, const std::filesystem::path& folder, bool json)
 void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
     auto* const verb = app.add_subcommand(
         "scan", "Ask the module whether it claims a folder, and list its movies");
-    verb->footer("Example: cliphost scan ~/Videos");
+    verb->footer(
+        "Examples:\n"
+        "  cliphost scan ~/Videos\n"
+        "  cliphost scan ~/Videos --json");
     auto folder = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);
     verb->add_option("folder", *folder, "The folder")->required();

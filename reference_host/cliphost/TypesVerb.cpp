@@ -69,7 +69,10 @@ nlohmann::ordered_json ToJson(const std::vector<FileType>& types) {
 
 void AddTypes(CLI::App& app, const SessionOptions& options, int&) {
     auto* const verb = app.add_subcommand("types", "List the file types that the module claims");
-    verb->footer("Example: cliphost types --json");
+    verb->footer(
+        "Examples:\n"
+        "  cliphost types\n"
+        "  cliphost types --json");
     auto json = std::make_shared<bool>(false);
     verb->add_flag("--json", *json, "As JSON");
     verb->callback([&options, json] {

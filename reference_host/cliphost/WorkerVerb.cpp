@@ -19,17 +19,28 @@ MovieAnswer Failed(int status, Problem problem) {
 
 }  // namespace
 
+MovieAnswer AnswerOfMovie(const std::filesystem::path& movie,
+                          const std::function<MovieAnswer()>& answer) {
+    try {
+        return answer();
+    } catch (const ReaderGone&) {
+        throw;
+    } catch (const host::MovieLibraryMissing&) {
+        throw;
+    } catch (const Failure& failure) {
+        return Failed(failure.status(), failure.problem());
+    } catch (const std::exception& error) {
+        return Failed(kExitFile, {movie, error.what()});
+    }
+}
+
 MovieAnswer AnswerSafely(const std::filesystem::path& movie,
                          const std::function<MovieAnswer()>& answer) {
     try {
-        return answer();
-    } catch (const Failure& failure) {
-        return Failed(failure.status(), failure.problem());
+        return AnswerOfMovie(movie, answer);
     } catch (const host::MovieLibraryMissing& missing) {
         return Failed(kExitCaller,
                       {movie, missing.what(), "install cliphost anew, with all its files"});
-    } catch (const std::exception& error) {
-        return Failed(kExitFile, {movie, error.what()});
     }
 }
 

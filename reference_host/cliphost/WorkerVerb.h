@@ -24,7 +24,11 @@ CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker
 void Serve(Session& session, const WorkerVerb& worker,
            const std::function<std::string(std::uint64_t, const std::string&)>& answer);
 
-// One movie's answer, whatever happens to it.
+// One movie's answer, whatever the movie does. Throws what is nobody's movie's fault: ReaderGone
+// and MovieLibraryMissing.
+MovieAnswer AnswerOfMovie(const std::filesystem::path& movie,
+                          const std::function<MovieAnswer()>& answer);
+// The same of a child process, which has no other way to tell of its library. Throws ReaderGone.
 MovieAnswer AnswerSafely(const std::filesystem::path& movie,
                          const std::function<MovieAnswer()>& answer);
 

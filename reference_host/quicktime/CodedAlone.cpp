@@ -13,6 +13,9 @@ namespace {
 
 using header_parser::Code;
 
+// Codecs without other pictures that the library doesn't mark as such.
+constexpr AVCodecID kIntraCodecs[] = {AV_CODEC_ID_PNG, AV_CODEC_ID_CFHD};
+
 // Forms of codecs that have other pictures elsewhere: IMX, and AVC-Intra.
 constexpr ncfUInt32 kIntraCodes[] = {
     Code("mx3n"), Code("mx3p"), Code("mx4n"), Code("mx4p"), Code("mx5n"), Code("mx5p"),
@@ -32,16 +35,19 @@ bool IsIntraProfile(const AVCodecParameters& form) {
            (profile == kHigh10 || profile == kHigh422 || profile == kHigh444);
 }
 
-bool IsCodedAlone(const AVCodecParameters& form) {
-    const AVCodecDescriptor* const codec = avcodec_descriptor_get(form.codec_id);
-    return (codec && (codec->props & AV_CODEC_PROP_INTRA_ONLY) != 0) ||
-           form.codec_id == AV_CODEC_ID_PNG ||
-           std::find(std::begin(kIntraCodes), std::end(kIntraCodes), CodeOfTag(form.codec_tag)) !=
-               std::end(kIntraCodes) ||
-           IsIntraProfile(form);
+template <typename Value, std::size_t kCount>
+bool IsOneOf(const Value (&values)[kCount], Value value) {
+    return std::find(std::begin(values), std::end(values), value) != std::end(values);
 }
 
 }  // namespace
+
+bool IsCodedAlone(const AVCodecParameters& form) {
+    const AVCodecDescriptor* const codec = avcodec_descriptor_get(form.codec_id);
+    return (codec && (codec->props & AV_CODEC_PROP_INTRA_ONLY) != 0) ||
+           IsOneOf(kIntraCodecs, form.codec_id) ||
+           IsOneOf(kIntraCodes, CodeOfTag(form.codec_tag)) || IsIntraProfile(form);
+}
 
 bool AreCodedAlone(const std::filesystem::path& movie) {
     std::string ignored;

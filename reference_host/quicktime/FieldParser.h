@@ -2,7 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "reference_host/quicktime/AvOwners.h"
+#include <optional>
+
+#include "reference_host/quicktime/CodecParser.h"
 
 namespace host {
 
@@ -20,11 +22,7 @@ public:
     FieldKind KindOf(const AVPacket& packet);
 
 private:
-    struct CloseParser {
-        void operator()(AVCodecParserContext* parser) const { av_parser_close(parser); }
-    };
-    std::unique_ptr<AVCodecParserContext, CloseParser> parser_;  // null: all are whole
-    CodecOwner codec_;
+    std::optional<CodecParser> parser_;  // without: all are whole
 };
 
 }  // namespace host

@@ -9,8 +9,10 @@
 #include <optional>
 #include <utility>
 
+#include "reference_host/quicktime/CodedAlone.h"
 #include "reference_host/quicktime/FieldParser.h"
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/SyncTeller.h"
 
 namespace host {
 namespace {
@@ -57,9 +59,10 @@ void AddSecondField(PacketEntry& picture, const PacketEntry& field) {
     picture.isDisposable = picture.isDisposable && field.isDisposable;
 }
 
-// Gives each picture of the stream until `each` has had enough.
+// Gives each picture of the stream until `each` has had enough. `syncs`: where the container is not
+// believed; null: it is.
 template <class Each>
-void ReadThrough(AVFormatContext& input, int stream, Each each) {
+void ReadThrough(AVFormatContext& input, int stream, SyncTeller* syncs, Each each) {
     UseOneStream(input, stream);
     FieldParser parser(*input.streams[stream]);
     const PacketOwner packet(av_packet_alloc());
@@ -71,7 +74,8 @@ void ReadThrough(AVFormatContext& input, int stream, Each each) {
             continue;
         }
         const FieldKind kind = parser.KindOf(*packet);
-        const PacketEntry entry = EntryOf(*packet);
+        PacketEntry entry = EntryOf(*packet);
+        entry.isSync = syncs ? syncs->StandsAlone(*packet) : entry.isSync;
         av_packet_unref(packet.get());
         if (waiting) {
             const bool isPair = kind != FieldKind::Whole && kind != waitingKind;
@@ -105,6 +109,13 @@ constexpr std::size_t kPacketsThatTell = 32;
 bool AreAllSync(const std::vector<PacketEntry>& packets) {
     return std::all_of(packets.begin(), packets.end(),
                        [](const PacketEntry& packet) { return packet.isSync; });
+}
+
+// Nothing tells which of them stand alone.
+void BelieveFirstSync(std::vector<PacketEntry>& packets) {
+    for (std::size_t i = 1; i < packets.size(); ++i) {
+        packets[i].isSync = false;
+    }
 }
 
 // Pictures of more bits are no numbers of a palette.
@@ -186,8 +197,10 @@ std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool in
         enough = isInOrder ? 1 : enough;
         isInOrder = isInOrder || (!indexed.empty() && AreAllSync(indexed));
     }
+    const bool isDoubted = indexIsWhole && AreAllSync(indexed) && !IsCodedAlone(*of.codecpar);
+    const auto syncs = isDoubted ? SyncTeller::Of(of) : nullptr;
     std::vector<PacketEntry> packets;
-    ReadThrough(input, stream, [&](const PacketEntry& entry) {
+    ReadThrough(input, stream, syncs.get(), [&](const PacketEntry& entry) {
         packets.push_back(entry);
         isInOrder = isInOrder && IsShownAsLate(packets.front(), entry);
         return !isInOrder || packets.size() < enough;
@@ -195,8 +208,12 @@ std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool in
     if (isInOrder && !indexed.empty() && !packets.empty()) {
         indexed.front().palette = packets.front().palette;
     }
-    SpreadPalettes(isInOrder ? indexed : packets);
-    return isInOrder ? indexed : packets;
+    std::vector<PacketEntry>& whole = isInOrder ? indexed : packets;
+    SpreadPalettes(whole);
+    if (isDoubted && !syncs) {
+        BelieveFirstSync(whole);
+    }
+    return std::move(whole);
 }
 
 bool AreStoredPlain(const std::filesystem::path& path, int stream, int count) {
@@ -237,7 +254,7 @@ ncfUInt64 CountShownPackets(AVFormatContext& input, int stream, bool indexIsWhol
         }
         return count;
     }
-    ReadThrough(input, stream, [&](const PacketEntry& entry) {
+    ReadThrough(input, stream, nullptr, [&](const PacketEntry& entry) {
         count += entry.isShown;
         return count < enough;
     });

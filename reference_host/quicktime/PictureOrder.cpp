@@ -63,6 +63,14 @@ PictureOrder::PictureOrder(std::vector<PacketEntry> packets) : packets_(std::mov
     FindStarts();
 }
 
+void PictureOrder::TakeBackSyncs(std::size_t first, std::size_t end) {
+    for (std::size_t i = first; i < end; ++i) {
+        packets_[i].isSync = false;
+    }
+    isIntraOnly_ = isIntraOnly_ && first >= end;
+    FindStarts();
+}
+
 void PictureOrder::FindStarts() {
     if (!hasDisplayTimes_) {
         return;  // pictures are counted, from the first

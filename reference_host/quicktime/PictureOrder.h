@@ -29,6 +29,8 @@ public:
     bool IsWholeFrom(std::size_t picture, std::size_t start) const {
         return picture < pictures_.size() && pictures_[picture].start >= start;
     }
+    // Packets that were told as sync and are none, from `first` to before `end`.
+    void TakeBackSyncs(std::size_t first, std::size_t end);
     bool IsIntraOnly() const { return isIntraOnly_; }
     // Some containers do not tell when a packet is shown.
     bool HasDisplayTimes() const { return hasDisplayTimes_; }

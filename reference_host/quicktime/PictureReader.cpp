@@ -56,6 +56,7 @@ PictureReader::PictureReader(std::filesystem::path path, InputOwner input, Codec
       codec_(std::move(codec)),
       stream_(stream),
       order_(std::move(order)),
+      syncClaims_(SyncClaims::Doubted(path_, stream_, Form(), order_)),
       isSeekable_(TellsTimesOfAll(*input_)),
       marksCutPackets_(IsMovieFamily(*input_)),
       cache_(kMostCachedBytes),
@@ -86,6 +87,9 @@ NCFRESULT PictureReader::Read(std::size_t picture, std::shared_ptr<const AVFrame
         return NCF_OK;
     }
     mostKept_ = goesBack && !order_.IsIntraOnly() ? kKeptBackward : kKeptForward;
+    if (!MayContinueTo(picture) && syncClaims_) {
+        syncClaims_->Check(order_, picture);
+    }
     if (!MayContinueTo(picture)) {
         const NCFRESULT started = StartAt(order_.StartFor(picture));
         if (started < 0) {

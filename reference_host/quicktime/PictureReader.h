@@ -9,6 +9,7 @@
 #include "host_interfaces/framework/ResultCodes.h"
 #include "reference_host/quicktime/PictureCache.h"
 #include "reference_host/quicktime/PictureOrder.h"
+#include "reference_host/quicktime/SyncClaims.h"
 
 namespace host {
 
@@ -56,6 +57,7 @@ private:
     CodecOwner codec_;
     int stream_;
     PictureOrder order_;
+    std::unique_ptr<SyncClaims> syncClaims_;  // null: all are true
     bool isSeekable_;
     bool marksCutPackets_;  // a packet marked as corrupt is one that the file's end cut
     PictureCache cache_;

@@ -7,6 +7,7 @@
 #include "reference_host/framework/Guard.h"
 #include "reference_host/quicktime/MovieFile.h"
 #include "reference_host/quicktime/OpenInput.h"
+#include "reference_host/quicktime/PacketSeek.h"
 #include "reference_host/quicktime/PictureDecoder.h"
 #include "reference_host/quicktime/PictureReader.h"
 #include "reference_host/quicktime/Thumbnails.h"
@@ -14,9 +15,6 @@
 
 namespace host {
 namespace {
-
-// Packets read after a seek until the one sought is there.
-constexpr int kMostPackets = 64;
 
 // Where all samples claim to be sync samples, decoders that know other pictures by their
 // content leave these out; for the rest only codecs without such pictures are believed.
@@ -50,8 +48,6 @@ private:
     void FindSyncs();
     void LearnLead();
     bool OpenSyncDecoder();
-    bool Seek(const PacketEntry& entry);
-    bool Reach(const PacketEntry& entry);
     FrameOwner DecodeAlone(std::size_t picture);
     NCFRESULT ReadExactly(std::size_t picture, Thumbnail& thumbnail);
     bool Write(const AVFrame& frame, Thumbnail& thumbnail) const;
@@ -146,32 +142,13 @@ bool ThumbnailReader::OpenSyncDecoder() {
     return codec_ != nullptr;
 }
 
-// Whether the packet at hand is then that of the entry.
-bool ThumbnailReader::Seek(const PacketEntry& entry) {
-    for (const ncfSInt64 time : {entry.displayTime + lead_, entry.decodeTime}) {
-        if (time != AV_NOPTS_VALUE &&
-            av_seek_frame(input_.get(), source_.stream, time, AVSEEK_FLAG_BACKWARD) >= 0 &&
-            Reach(entry)) {
-            return (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0;
-        }
-    }
-    return false;
-}
-
-bool ThumbnailReader::Reach(const PacketEntry& entry) {
-    for (int i = 0; i < kMostPackets && av_read_frame(input_.get(), packet_.get()) >= 0; ++i) {
-        if (packet_->stream_index == source_.stream && packet_->pos == entry.position) {
-            return true;
-        }
-        av_packet_unref(packet_.get());
-    }
-    return false;
-}
-
 // Null where it takes more than this one sample.
 FrameOwner ThumbnailReader::DecodeAlone(std::size_t picture) {
     const bool isThere =
-        OpenSyncDecoder() && packet_ && Seek(order_.Packet(order_.PacketOfPicture(picture)));
+        OpenSyncDecoder() && packet_ &&
+        ReadPacketOf(*input_, source_.stream, order_.Packet(order_.PacketOfPicture(picture)), lead_,
+                     *packet_) &&
+        (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0;
     FrameOwner frame(av_frame_alloc());
     const bool isDecoded = isThere && frame &&
                            avcodec_send_packet(codec_.get(), packet_.get()) >= 0 &&

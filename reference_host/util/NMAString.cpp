@@ -53,6 +53,7 @@ NMAString& NMAString::operator=(const NMAString& other) {
     const std::lock_guard<std::mutex> guard(state_->mutex);
     state_->shown.Reset();
     state_->TakeOver(copy);
+    state_->encoding = copy.encoding;
     return *this;
 }
 

@@ -70,7 +70,6 @@ struct NMAString::State {
     }
 
     void TakeOver(State& other) {
-        encoding = other.encoding;
         utf8_ = std::move(other.utf8_);
         characters_ = std::move(other.characters_);
         wider_.reset();
@@ -98,7 +97,7 @@ struct NMAString::State {
         State current;
         current.Read(shown.get());
         if (!Equals(current)) {
-            TakeFrom(current);
+            TakeOver(current);
         }
     }
 

@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 // What every test program begins with. A row of ctest's may be many tests; so a program that runs
-// none fails, and one that a test ends before the others ran.
+// none fails, and one in which a test calls exit before the others ran.
 
 #include <gtest/gtest.h>
 #include <unistd.h>

@@ -363,10 +363,10 @@ class Stringout : public BinFile {
 protected:
     // The tracks of the sequence of all movies in the folder `in`.
     Json SequenceOf(const std::string& before = "") {
-        EXPECT_EQ(RunCliphost(before + " describe -q " + In("in") + " --stringout --bin " +
-                              In("bin.aaf"))
-                      .status,
-                  0);
+        EXPECT_EQ(
+            RunCliphost(before + " describe -q " + In("in") + " --stringout --bin " + In("bin.aaf"))
+                .status,
+            0);
         const std::vector<Json> sequences = MobsOf(Dump("bin.aaf"), "CompositionMob");
         EXPECT_EQ(sequences.size(), 1u);
         return sequences.empty() ? Json() : sequences[0];

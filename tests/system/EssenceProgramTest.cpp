@@ -233,9 +233,11 @@ TEST_F(EssenceProgram, ShowsNoProgressWhereThereIsNoTerminal) {
     EXPECT_EQ(result.out, (folder() / "frames").string() + ": 3 pictures\n");
 }
 
-TEST_F(EssenceProgram, HelpsWithAnExampleForEachVerb) {
-    for (const char* const verb : {"samples", "formats", "frame", "contact", "audio"}) {
-        ExpectSays(RunCliphost(std::string(verb) + " --help"), 0, "Example: cliphost ");
+TEST_F(EssenceProgram, HelpsWithExamplesForEachVerb) {
+    for (const std::string verb :
+         {"scan", "describe", "dump", "verify", "relink", "samples", "formats", "frame", "contact",
+          "params", "audio", "types", "plugin"}) {
+        ExpectSays(RunCliphost(verb + " --help"), 0, "Examples:\n  cliphost " + verb);
     }
 }
 

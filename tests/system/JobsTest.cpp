@@ -499,6 +499,28 @@ TEST_F(JobsOfFrames, WriteTheSamePicturesAndBytes) {
     EXPECT_EQ(ExpectTheSame(movie + " --range 3:90:3", "pictures", kTwo).files.size(), 29u);
 }
 
+// They don't list their sync samples, and need not: all of theirs are.
+TEST_F(JobsOfFrames, ReadInPiecesOfTheirOwnWhatIsCodedAlone) {
+    const std::pair<const char*, const char*> codecs[] = {
+        {"cfhd", "-c:v cfhd"},
+        {"dnxhr", "-c:v dnxhd -profile:v dnxhr_lb -pix_fmt yuv422p"},
+        {"dv", "-vf scale=720:576 -r 25 -c:v dvvideo -pix_fmt yuv420p"},
+        {"hap", "-c:v hap"}};
+    for (const auto& [name, codec] : codecs) {
+        SCOPED_TRACE(name);
+        const auto movie = Movie(std::string(name) + ".mov", codec);
+        EXPECT_EQ(ExpectTheSame(Quoted(movie) + " --range :96", "a.raw", kTwo).printed.status, 0);
+        // What is lost costs the pieces behind it nothing.
+        std::filesystem::create_directories(folder() / "in" / name);
+        const std::string crashing = "in/" + std::string(name) + "/crash-at-40.mov";
+        std::filesystem::copy_file(movie, folder() / crashing);
+        const CommandResult ran =
+            Harmed("frame " + In(crashing) + " --range :96 --jobs 2 -o " + In("a.raw"));
+        ExpectSays(ran, 1, "frames 39 to 51 are left out: ");
+        ExpectSays(ran, 1, ": 83 raw frames\n");
+    }
+}
+
 // Its pictures lie far from those that stand alone, and are stored in another order than shown.
 TEST_F(JobsOfFrames, WriteTheSameOfAMovieOfLongGroups) {
     const std::string movie =

@@ -422,7 +422,8 @@ TEST_F(RelinkVerb, SearchesFoldersBehindLinksOnce) {
     fs::create_directories(folder() / "new");
     fs::create_directory_symlink(folder() / "elsewhere", folder() / "new/link");
     fs::create_directory_symlink(folder() / "new", folder() / "elsewhere/round");
-    ExpectSays(RunCliphost(Call()), 0, "a -> " + (folder() / "new/link/a.mov").string() + "\n");
+    const CommandResult ran = RunCliphost(Call());
+    ExpectSays(ran, 0, "a -> " + (folder() / "new/link/a.mov").string() + "\n");
 }
 
 TEST_F(RelinkVerb, LeavesAllElseAsItIs) {

@@ -10,6 +10,8 @@ namespace {
 
 constexpr std::string_view kScheme = "file://";
 constexpr std::string_view kThisMachine = "localhost";
+// A slash in its name, encoded, would make it a folder where it is written as a path.
+constexpr std::string_view kNotOfMachine("/\0", 2);
 constexpr char kDigits[] = "0123456789ABCDEF";
 
 bool IsUnreserved(unsigned char byte) {
@@ -84,7 +86,8 @@ bool SplitFileUrl(std::string_view url, std::string& machine, std::string& path)
     std::string ofMachine;
     std::string ofPath;
     if (slash == std::string_view::npos || !PercentDecoded(url.substr(0, slash), ofMachine) ||
-        !PercentDecoded(url.substr(slash), ofPath) || ofMachine.find('\0') != std::string::npos ||
+        !PercentDecoded(url.substr(slash), ofPath) ||
+        ofMachine.find_first_of(kNotOfMachine) != std::string::npos ||
         ofPath.find('\0') != std::string::npos) {
         return false;
     }

@@ -21,7 +21,8 @@ std::string FileUrl(std::string_view path);
 bool IsFileUrl(std::string_view text);
 
 // The parts of a file URL, decoded: the machine, empty for this one, and the rooted path. False,
-// with both unchanged, for one without a rooted path, and for one with a byte of zero.
+// with both unchanged, for one without a rooted path, for one with a byte of zero, and for one with
+// a slash in the machine's name.
 bool SplitFileUrl(std::string_view url, std::string& machine, std::string& path);
 
 // The path that a file URL names on this machine. False, with `path` unchanged,

@@ -23,6 +23,10 @@ TEST(CodedAlone, IsWhatCodecsWithoutOtherPicturesMake) {
     EXPECT_TRUE(IsAlone("-c:v mjpeg"));
     EXPECT_TRUE(IsAlone("-c:v png"));
     EXPECT_TRUE(IsAlone("-c:v v210"));
+    EXPECT_TRUE(IsAlone("-c:v cfhd"));
+    EXPECT_TRUE(IsAlone("-c:v dnxhd -profile:v dnxhr_lb -pix_fmt yuv422p"));
+    EXPECT_TRUE(IsAlone("-vf scale=720:576 -c:v dvvideo -pix_fmt yuv420p"));
+    EXPECT_TRUE(IsAlone("-c:v hap"));
 }
 
 TEST(CodedAlone, IsToldByTheCodeOrProfileOfOthers) {

@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
+#include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/PictureReader.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
@@ -85,6 +88,88 @@ TEST(PictureReader, GivesTheSamePictureAfterAJumpAsInSequence) {
             ASSERT_EQ(jumping->Read(i, frame), NCF_OK) << i;
             EXPECT_EQ(Luma(*frame), pictures[i]) << i;
         }
+    }
+}
+
+// The same movie without its list of sync samples, which claims that all are.
+MadeMovie ClaimingAllSync(const MadeMovie& movie) {
+    Bytes bytes = movie.Content();
+    const std::string list = "stss";
+    const auto at = std::search(bytes.begin(), bytes.end(), list.begin(), list.end());
+    std::copy_n("free", at == bytes.end() ? 0 : list.size(), at);
+    return MadeMovie(bytes, ".mov");
+}
+
+// Where decoding can begin, content tells, and nothing for some codecs.
+TEST(PictureReader, GivesTheSamePictureAfterAJumpWhereAllSamplesClaimToBeSync) {
+    for (const char* const codec :
+         {"libx264 -bf 0 -pix_fmt yuv420p", "libx264 -bf 3 -pix_fmt yuv420p",
+          "libx264 -x264-params open-gop=1 -pix_fmt yuv420p",
+          "libx265 -bf 0 -x265-params log-level=none", "libx265 -bf 3 -x265-params log-level=none",
+          "mpeg2video", "mpeg2video -bf 2", "mpeg1video", "mpeg4", "mpeg4 -bf 2", "h263 -s 352x288",
+          "libvpx-vp9 -f mp4", "qtrle", "qtrle -pix_fmt argb", "qtrle -pix_fmt rgb555be",
+          "qtrle -pix_fmt gray", "rpza -s 480x272", "cinepak", "svq1 -s 352x288"}) {
+        SCOPED_TRACE(codec);
+        const MadeMovie movie("-f lavfi -i testsrc2=s=96x64:r=25:d=3 -g 20 -c:v " +
+                              std::string(codec));
+        const MadeMovie claiming = ClaimingAllSync(movie);
+        const auto inSequence = Open(movie);
+        const auto jumping = Open(claiming);
+        ASSERT_TRUE(inSequence && jumping);
+        ASSERT_EQ(jumping->Count(), inSequence->Count());
+        std::vector<Bytes> pictures;
+        std::shared_ptr<const AVFrame> frame;
+        for (std::size_t i = 0; i < inSequence->Count(); ++i) {
+            ASSERT_EQ(inSequence->Read(i, frame), NCF_OK) << i;
+            pictures.push_back(Luma(*frame));
+        }
+        for (const std::size_t i : {36u, 37u, 50u, 20u, 70u, 69u, 30u, 31u, 39u, 40u, 5u, 38u}) {
+            ASSERT_EQ(jumping->Read(i, frame), NCF_OK) << i;
+            EXPECT_EQ(Luma(*frame), pictures[i]) << i;
+        }
+    }
+}
+
+// Of pictures that are shown in another order all are looked at.
+TEST(PacketList, KnowsTheSyncSamplesOfReorderedPicturesByContent) {
+    const auto syncs = [](const MadeMovie& movie) {
+        const host::InputOwner input =
+            host::OpenForStream(movie.Path(), host::InputView::AsPresented, 0);
+        std::vector<std::size_t> numbers;
+        const auto packets = host::ListPackets(*input, 0, true);
+        for (std::size_t i = 0; i < packets.size(); ++i) {
+            if (packets[i].isSync) {
+                numbers.push_back(i);
+            }
+        }
+        return numbers;
+    };
+    for (const char* const codec :
+         {"libx264", "libx265 -x265-params log-level=none", "mpeg2video", "mpeg4"}) {
+        SCOPED_TRACE(codec);
+        const MadeMovie movie(
+            "-f lavfi -i testsrc2=s=96x64:r=25:d=3 -g 20 -bf 2 -pix_fmt yuv420p -c:v " +
+            std::string(codec));
+        EXPECT_EQ(syncs(ClaimingAllSync(movie)), syncs(movie));
+        EXPECT_LT(syncs(movie).size(), 10u);
+    }
+}
+
+TEST(PictureReader, BelievesTheClaimWhereItIsTrue) {
+    for (const char* const codec :
+         {"libx264 -pix_fmt yuv420p -tune zerolatency -threads 1", "mpeg2video -threads 1", "qtrle",
+          "qtrle -pix_fmt argb", "prores_ks -threads 1"}) {
+        SCOPED_TRACE(codec);
+        const MadeMovie movie("-f lavfi -i testsrc2=s=96x64:r=25:d=12 -g 1 -c:v " +
+                              std::string(codec));
+        const MadeMovie claiming = ClaimingAllSync(movie);
+        const auto reader = Open(claiming);
+        ASSERT_TRUE(reader);
+        std::shared_ptr<const AVFrame> frame;
+        for (const std::size_t i : {290u, 100u, 200u}) {
+            ASSERT_EQ(reader->Read(i, frame), NCF_OK) << i;
+        }
+        EXPECT_LE(reader->DecodedPackets(), 3 + kAhead);
     }
 }
 

@@ -71,8 +71,9 @@ TEST(SplitFileUrl, KnowsThisMachineInCapitalsToo) {
 
 TEST(SplitFileUrl, LeavesBothAloneWhereItFails) {
     std::string machine = "before", path = "before";
-    for (const char* const url : {"http://a/b", "file://server", "file://", "file:///%zz",
-                                  "file://%00/a", "file:///%00", "/a"}) {
+    for (const char* const url :
+         {"http://a/b", "file://server", "file://", "file:///%zz", "file://%00/a", "file:///%00",
+          "file://a%2Fb/c", "file://%2f/c", "/a"}) {
         EXPECT_FALSE(host::text::SplitFileUrl(url, machine, path)) << url;
         EXPECT_EQ(machine + path, "beforebefore") << url;
     }
