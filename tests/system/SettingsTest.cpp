@@ -7,6 +7,9 @@
 #include <cstdlib>
 #include <fstream>
 #include <nlohmann/json.hpp>
+#include <set>
+#include <sstream>
+#include <vector>
 
 #include "tests/system/Command.h"
 #include "tests/system/SystemTest.h"
@@ -181,6 +184,41 @@ TEST_F(SettingsFile, HasAnExampleThatWorks) {
     Settings(all);
     EXPECT_EQ(RunCliphost("types").status, 0) << RunCliphost("types").out;
     ExpectSays(Describe("--aaf " + In("a.aaf")), 2, "nothing was mapped by it");
+}
+
+// What help lists as `--name` or `-n`, in the order of the lines.
+std::vector<std::string> OptionsOf(const std::string& verb) {
+    std::vector<std::string> names;
+    std::istringstream help(RunCliphost(verb + " --help").out);
+    for (std::string line; std::getline(help, line);) {
+        const std::size_t start = line.rfind("  -", 0) == 0 ? line.find("--") : std::string::npos;
+        const std::size_t first = start == std::string::npos ? 3 : start + 2;
+        if (line.rfind("  -", 0) == 0) {
+            names.push_back(line.substr(first, line.find_first_of(" ,=", first) - first));
+        }
+    }
+    return names;
+}
+
+TEST_F(SettingsFile, TakesEveryOptionOfEveryVerb) {
+    const std::set<std::string> none = {"help", "version", "config", "no-config"};
+    std::size_t options = 0;
+    for (const char* const verb :
+         {"", "scan", "describe", "samples", "formats", "frame", "contact", "audio", "dump",
+          "verify", "relink", "types", "params", "plugin"}) {
+        for (const std::string& name : OptionsOf(verb)) {
+            if (none.count(name) == 0) {
+                ++options;
+                // Of a verb that does not run, values are not looked at.
+                const std::string section = *verb ? std::string("[") + verb + "]\n" : "";
+                Settings(section + name + " = x\n");
+                const CommandResult ran = RunCliphost(*verb == 't' ? "plugin" : "types");
+                EXPECT_EQ(ran.out.find("no such option"), std::string::npos) << ran.out;
+                EXPECT_TRUE(ran.status == 0 || *verb == 0) << verb << ' ' << name << ran.out;
+            }
+        }
+    }
+    EXPECT_GT(options, 80u);
 }
 
 TEST_F(SettingsFile, LeavesHelpAlone) {
