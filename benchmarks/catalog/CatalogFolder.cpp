@@ -84,7 +84,7 @@ catalog::Entry MadeUp(int number) {
                         {"codec", isProRes ? "apcn" : "avc1"},
                         {"codec_name", isProRes ? "Apple ProRes 422" : "H.264"}}};
     entry["columns"] = {
-        {{"place", "0"}, {"name", "Reel"}, {"value", "R" + std::to_string(number / 200)}},
+        {{"place", "0"}, {"name", "Reel"}, {"value", "R" + std::to_string(number % 500)}},
         {{"place", "1"}, {"name", "Comment"}, {"value", "take " + std::to_string(number % 17)}}};
     return entry;
 }
