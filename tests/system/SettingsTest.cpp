@@ -205,13 +205,13 @@ TEST_F(SettingsFile, TakesEveryOptionOfEveryVerb) {
     std::size_t options = 0;
     for (const char* const verb :
          {"", "scan", "describe", "samples", "formats", "frame", "contact", "audio", "dump",
-          "verify", "relink", "types", "params", "plugin"}) {
+          "verify", "relink", "types", "params", "plugin", "catalog", "find"}) {
         for (const std::string& name : OptionsOf(verb)) {
             if (none.count(name) == 0) {
                 ++options;
                 // Of a verb that does not run, values are not looked at.
                 const std::string section = *verb ? std::string("[") + verb + "]\n" : "";
-                Settings(section + name + " = x\n");
+                Settings(section + name + " = 'x'\n");
                 const CommandResult ran = RunCliphost(*verb == 't' ? "plugin" : "types");
                 EXPECT_EQ(ran.out.find("no such option"), std::string::npos) << ran.out;
                 EXPECT_TRUE(ran.status == 0 || *verb == 0) << verb << ' ' << name << ran.out;
