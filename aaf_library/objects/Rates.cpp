@@ -42,6 +42,14 @@ aafPosition_t Plus(aafPosition_t left, aafPosition_t right) {
     return left < 0 ? Limits::min() : Limits::max();
 }
 
+aafPosition_t Minus(aafPosition_t left, aafPosition_t right) {
+    aafPosition_t difference = 0;
+    if (!__builtin_sub_overflow(left, right, &difference)) {
+        return difference;
+    }
+    return left < 0 ? Limits::min() : Limits::max();
+}
+
 aafPosition_t Rescaled(aafPosition_t position, const aafRational_t& from, const aafRational_t& to) {
     if (!IsRate(from) || !IsRate(to)) {
         return position;

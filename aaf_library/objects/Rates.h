@@ -11,8 +11,9 @@ namespace aaf {
 
 class Object;
 
-// A sum that stays at the end of its range.
+// A sum and a difference that stay at the end of their range.
 aafPosition_t Plus(aafPosition_t left, aafPosition_t right);
+aafPosition_t Minus(aafPosition_t left, aafPosition_t right);
 
 // From one rate to another, rounded down; unchanged where a rate is missing.
 aafPosition_t Rescaled(aafPosition_t position, const aafRational_t& from, const aafRational_t& to);

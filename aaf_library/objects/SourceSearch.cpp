@@ -50,8 +50,8 @@ HRESULT IntoSequence(const Sequence& sequence, aafOperationChoice_t choice, At& 
             const bool blends = dynamic_cast<const Transition*>(next) != nullptr;
             before = At{part, start};
             const aafPosition_t end = Plus(start, length);
-            if (at.position < (blends ? Plus(end, -KnownLength(*next)) : end)) {
-                at = At{part, Plus(at.position, -start)};
+            if (at.position < (blends ? Minus(end, KnownLength(*next)) : end)) {
+                at = At{part, Minus(at.position, start)};
                 return AAFRESULT_SUCCESS;
             }
             start = end;
@@ -59,13 +59,13 @@ HRESULT IntoSequence(const Sequence& sequence, aafOperationChoice_t choice, At& 
         }
         // A transition lies over the end of what is before it and the start of what is behind.
         const aafPosition_t end = start;
-        start = Plus(start, -length);
+        start = Minus(start, length);
         if (at.position >= end || choice == kAAFFindIncoming) {
             continue;
         }
         at = choice == kAAFFindOutgoing
-                 ? At{before.component, Plus(at.position, -before.position)}
-                 : At{PartOf(*part, prop::Transition_OperationGroup), Plus(at.position, -start)};
+                 ? At{before.component, Minus(at.position, before.position)}
+                 : At{PartOf(*part, prop::Transition_OperationGroup), Minus(at.position, start)};
         return at.component == nullptr ? AAFRESULT_TRAVERSAL_NOT_POSS : AAFRESULT_SUCCESS;
     }
     return AAFRESULT_TRAVERSAL_NOT_POSS;
@@ -172,7 +172,7 @@ HRESULT Follow(const ContentStorage& storage, aafOperationChoice_t choice, Sourc
     const aafPosition_t start = Plus(clip.IntegerOr(prop::SourceClip_StartTime, 0), at.position);
     place.reference = {id, slotId, Rescaled(start, from, place.editRate)};
     place.length = clip.IsPresent(prop::Component_Length)
-                       ? Rescaled(Plus(KnownLength(clip), -at.position), from, place.editRate)
+                       ? Rescaled(Minus(KnownLength(clip), at.position), from, place.editRate)
                        : -1;
     return AAFRESULT_SUCCESS;
 }
