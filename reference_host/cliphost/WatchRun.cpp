@@ -5,6 +5,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <chrono>
 #include <cstdio>
 #include <set>
@@ -170,7 +171,8 @@ private:
         if (poll_ == 0) {
             const int error = system_.Add(folder);
             std::error_code ignored;
-            if (error != 0 && std::filesystem::is_directory(folder, ignored)) {
+            // One that is closed can't be listed either, which is told below.
+            if (error != 0 && error != EACCES && std::filesystem::is_directory(folder, ignored)) {
                 poll_ = kPollWhereNothingTells;
                 Notice(
                     "cliphost: {}: the system does not tell what happens there: {}; all is "
