@@ -75,6 +75,7 @@ catalog::Entry MadeUp(int number) {
          {"length", "250"},
          {"start", "10:00:00:00"},
          {"codec", isProRes ? "apcn" : "avc1"},
+         {"codec_name", isProRes ? "Apple ProRes 422" : "H.264"},
          {"width", "1920"},
          {"height", "1080"},
          {"alpha", number % 100 == 0 ? "1" : "0"},

@@ -12,14 +12,14 @@
 namespace catalog {
 namespace {
 
-enum class Kind { Words, Number, Size, Rate, YesNo, Choice, Timecode, Columns };
+enum class Kind { Words, Either, Number, Size, Rate, YesNo, Choice, Timecode, Columns };
 
 struct Field {
     const char* name;
     Kind kind;
-    // Words: the columns of the texts. Choice: a column, and behind it, after spaces, what it may
-    // hold. Columns: the names of bin columns, as a list; none: the value begins with the name.
-    // The rest: an expression on a movie.
+    // Words: the columns of the texts. Either: two columns of which one contains the value. Choice:
+    // a column, and behind it, after spaces, what it may hold. Columns: the names of bin columns,
+    // as a list; none: the value begins with the name. The rest: an expression on a movie.
     const char* on;
     const char* example;
     const char* meaning;
@@ -28,8 +28,10 @@ struct Field {
 constexpr Field kFields[] = {
     {"name", Kind::Words, "name", "name:interview", "words of the clip's or the file's name"},
     {"path", Kind::Words, "path", "path:day2", "words of the path"},
-    {"codec", Kind::Words, "codec", "codec:prores", "the picture's codec, by name or code"},
-    {"sound", Kind::Words, "sound", "sound:aac", "the sound's codec, by name or code"},
+    {"codec", Kind::Either, "codec codec_name", "codec:prores",
+     "the picture's codec, by name or code"},
+    {"sound", Kind::Either, "sound_codec sound_name", "sound:aac",
+     "the first sound's codec, by name or code"},
     {"rate", Kind::Rate, "rate", "rate:23.976", "edit units a second; 24000/1001 too"},
     {"width", Kind::Number, "width", "width:>=1920", "of a frame, in pixels"},
     {"height", Kind::Number, "height", "height:1080", "of a frame, in pixels"},
@@ -242,6 +244,16 @@ std::string PatternOf(const std::string& value) {
     return pattern;
 }
 
+void AddEither(const Field& field, const std::string& value, Condition& all) {
+    const std::string_view on = field.on;
+    const std::size_t space = on.find(' ');
+    all.sql += fmt::format("{} LIKE ? ESCAPE '\\' OR {} LIKE ? ESCAPE '\\'", on.substr(0, space),
+                           on.substr(space + 1));
+    for (int i = 0; i < 2; ++i) {
+        all.values.emplace_back("%" + PatternOf(value) + "%");
+    }
+}
+
 void AddColumns(const Field& field, const std::string& value, Condition& all) {
     const bool isOfAnyName = *field.on == '\0';
     const std::size_t equal = value.find('=');
@@ -272,6 +284,8 @@ void AddTerm(const Term& term, Condition& all) {
     switch (field->kind) {
         case Kind::Words:
             return AddWords(field->on, term.value, all);
+        case Kind::Either:
+            return AddEither(*field, term.value, all);
         case Kind::Number:
             return AddRange(*field, term.value, NumberIn, 0, all);
         case Kind::Size:

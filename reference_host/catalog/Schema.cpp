@@ -38,8 +38,9 @@ CREATE TABLE movies (
 );
 CREATE INDEX movies_by_content ON movies (master_mob);
 CREATE INDEX movies_by_date ON movies (date);
-CREATE INDEX movies_by_picture ON movies (codec, rate, width, height, alpha);
-CREATE INDEX movies_by_rate ON movies (rate, codec);
+CREATE INDEX movies_by_codec ON movies (codec_name, codec);
+CREATE INDEX movies_by_rate ON movies (rate, width, height);
+CREATE INDEX movies_by_alpha ON movies (alpha, rate);
 CREATE INDEX movies_by_start ON movies (replace(start, ';', ':'));
 
 CREATE TABLE tracks (

@@ -57,9 +57,12 @@ struct FindOptions {
 };
 
 Statement Select(catalog::Catalog& catalog, const std::string& query) {
-    const catalog::Condition condition = catalog::ConditionOf(catalog::TermsOf(query));
+    const std::vector<catalog::Term> terms = catalog::TermsOf(query);
+    const catalog::Condition condition = catalog::ConditionOf(terms);
+    // The index of paths gives all movies in their order, but to find some there are better ones.
+    const char* const order = terms.empty() ? "path" : "+path";
     Statement select = catalog.database().Prepare(
-        fmt::format("SELECT {} FROM movies WHERE {} ORDER BY path", kColumns, condition.sql));
+        fmt::format("SELECT {} FROM movies WHERE {} ORDER BY {}", kColumns, condition.sql, order));
     int parameter = 0;
     for (const auto& value : condition.values) {
         ++parameter;

@@ -419,7 +419,7 @@ TEST_F(StoppedCatalogs, WithoutUpdateKeepTheOneThatWasThere) {
 
 TEST_F(StoppedCatalogs, AreWholeWhereTheProgramIsKilled) {
     Run("catalog in/1000.mov in/1001.mov -o c.sqlite --update");
-    for (const char* const pause : {"0.05", "0.3", "0.6"}) {
+    for (const char* const pause : {"0.05", "0.15", "0.3"}) {
         Stop("catalog in -o c.sqlite --update --jobs 2", "KILL", "sleep " + std::string(pause));
         EXPECT_GE(Names().size(), 2u);
         EXPECT_EQ(Ask("SELECT * FROM pragma_integrity_check"), Rows{"ok"});
