@@ -27,16 +27,19 @@ Versions RangeOf(IAAFPluginDef* plugin, Range range) {
     return {Of(low), Of(high)};
 }
 
-constexpr Range kRanges[] = {&IAAFPluginDef::GetPlatformVersionRange,
-                             &IAAFPluginDef::GetEngineVersionRange,
-                             &IAAFPluginDef::GetPluginAPIVersionRange};
 using SetVersion = HRESULT (IAAFPluginDef::*)(aafVersionType_constref);
-constexpr SetVersion kSetMinimum[] = {&IAAFPluginDef::SetPlatformMinimumVersion,
-                                      &IAAFPluginDef::SetEngineMinimumVersion,
-                                      &IAAFPluginDef::SetPluginAPIMinimumVersion};
-constexpr SetVersion kSetMaximum[] = {&IAAFPluginDef::SetPlatformMaximumVersion,
-                                      &IAAFPluginDef::SetEngineMaximumVersion,
-                                      &IAAFPluginDef::SetPluginAPIMaximumVersion};
+struct VersionRange {
+    Range get;
+    SetVersion setMinimum;
+    SetVersion setMaximum;
+};
+constexpr VersionRange kRanges[] = {
+    {&IAAFPluginDef::GetPlatformVersionRange, &IAAFPluginDef::SetPlatformMinimumVersion,
+     &IAAFPluginDef::SetPlatformMaximumVersion},
+    {&IAAFPluginDef::GetEngineVersionRange, &IAAFPluginDef::SetEngineMinimumVersion,
+     &IAAFPluginDef::SetEngineMaximumVersion},
+    {&IAAFPluginDef::GetPluginAPIVersionRange, &IAAFPluginDef::SetPluginAPIMinimumVersion,
+     &IAAFPluginDef::SetPluginAPIMaximumVersion}};
 using GetId = HRESULT (IAAFPluginDef::*)(aafUID_t*);
 using SetId = HRESULT (IAAFPluginDef::*)(aafUID_constref);
 constexpr GetId kGetIds[] = {&IAAFPluginDef::GetCategoryClass, &IAAFPluginDef::GetManufacturerID,
@@ -110,10 +113,11 @@ TEST_F(Definition, OfAPluginKeepsWhatItSays) {
         for (const SetId set : kSetIds) {
             EXPECT_EQ(AAFRESULT_SUCCESS, (made->*set)(kTwo));
         }
-        for (std::size_t at = 0; at < 3; ++at) {
-            const auto number = static_cast<aafInt8>(at);
-            EXPECT_EQ(AAFRESULT_SUCCESS, (made->*kSetMinimum[at])({number, 1}));
-            EXPECT_EQ(AAFRESULT_SUCCESS, (made->*kSetMaximum[at])({number, 2}));
+        aafInt8 number = 0;
+        for (const VersionRange& range : kRanges) {
+            EXPECT_EQ(AAFRESULT_SUCCESS, (made->*range.setMinimum)({number, 1}));
+            EXPECT_EQ(AAFRESULT_SUCCESS, (made->*range.setMaximum)({number, 2}));
+            ++number;
         }
         for (const SetFlag set : kSetFlags) {
             EXPECT_EQ(AAFRESULT_SUCCESS, (made->*set)(kAAFTrue));
@@ -131,8 +135,10 @@ TEST_F(Definition, OfAPluginKeepsWhatItSays) {
     for (const GetId get : kGetIds) {
         EXPECT_EQ(kTwo, Get(plugin, get));
     }
-    for (int at = 0; at < 3; ++at) {
-        EXPECT_EQ((Versions{{at, 1}, {at, 2}}), RangeOf(plugin, kRanges[at]));
+    int number = 0;
+    for (const VersionRange& range : kRanges) {
+        EXPECT_EQ((Versions{{number, 1}, {number, 2}}), RangeOf(plugin, range.get));
+        ++number;
     }
     for (const GetFlag get : kGetFlags) {
         EXPECT_EQ(kAAFTrue, Get(plugin, get));
@@ -166,17 +172,19 @@ TEST_F(Definition, OfAPluginChecksItsArguments) {
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, plugin->GetPluginManufacturerNameBufLen(&bytes));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, plugin->SetPluginVersionString(nullptr));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, plugin->SetPluginManufacturerName(nullptr));
-    for (std::size_t at = 0; at < 3; ++at) {
-        EXPECT_EQ(AAFRESULT_NULL_PARAM, (plugin->*kRanges[at])(nullptr, &version));
-        EXPECT_EQ(AAFRESULT_NULL_PARAM, (plugin->*kRanges[at])(&version, nullptr));
+    for (const VersionRange& range : kRanges) {
+        EXPECT_EQ(AAFRESULT_NULL_PARAM, (plugin->*range.get)(nullptr, &version));
+        EXPECT_EQ(AAFRESULT_NULL_PARAM, (plugin->*range.get)(&version, nullptr));
         // A range has both ends.
-        EXPECT_EQ(AAFRESULT_SUCCESS, (plugin->*kSetMinimum[at])(version));
-        EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, (plugin->*kRanges[at])(&version, &version));
+        EXPECT_EQ(AAFRESULT_SUCCESS, (plugin->*range.setMinimum)(version));
+        EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, (plugin->*range.get)(&version, &version));
     }
-    for (std::size_t at = 0; at < 3; ++at) {
-        EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, (plugin->*kGetFlags[at])(&flag));
-        EXPECT_EQ(AAFRESULT_NULL_PARAM, (plugin->*kGetFlags[at])(nullptr));
-        EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, (plugin->*kSetFlags[at])(2));
+    for (const GetFlag get : kGetFlags) {
+        EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, (plugin->*get)(&flag));
+        EXPECT_EQ(AAFRESULT_NULL_PARAM, (plugin->*get)(nullptr));
+    }
+    for (const SetFlag set : kSetFlags) {
+        EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, (plugin->*set)(2));
     }
     Ptr<IAAFNetworkLocator> info;
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, plugin->GetManufacturerInfo(info.Out()));
