@@ -198,8 +198,8 @@ void AddFind(CLI::App& app, int& status) {
         "word* finds\nwhat begins so; '-' before a word or field means that it must not fit (after "
         "-- where the query\nbegins with it). Numbers: 25, <10, >=1920, 10..20.\n\n" +
         FieldsHelp() +
-        "\nFor find, status 0 is that movies were found, 1 that none was, 2 that the call or the "
-        "catalog is at fault.");
+        "\nExit status: 0, movies were found; 1, none was; 2, the call or the catalog is at "
+        "fault.");
     auto options = std::make_shared<FindOptions>();
     verb->add_option("catalog", options->catalog, "The catalog")->required();
     verb->add_option("query", options->words, "Words and fields; none: all movies");

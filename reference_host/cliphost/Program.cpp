@@ -62,16 +62,20 @@ std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
                        host::text::PrintableLines(text));
 }
 
-// Each verb's help ends with it.
+// Each verb's help ends with it, or with the verb's own.
 void TellExitStatus(CLI::App& app) {
+    constexpr char kStart[] = "Exit status: ";
     const std::string text =
-        "Exit status: 0, everything was done; 1, the content of a file is at fault; 2, the call "
+        std::string(kStart) +
+        "0, everything was done; 1, the content of a file is at fault; 2, the call "
         "is at fault:\na wrong option, a file that does not exist, an output that can't be "
         "written. Of several failures\nthe highest counts.";
     app.footer(text);
     for (CLI::App* const verb : app.get_subcommands([](CLI::App*) { return true; })) {
         const std::string own = verb->get_footer();
-        verb->footer(own.empty() ? text : own + "\n\n" + text);
+        if (own.find(kStart) == std::string::npos) {
+            verb->footer(own.empty() ? text : own + "\n\n" + text);
+        }
     }
 }
 
