@@ -21,7 +21,7 @@ using catalog::Catalog;
 
 // So many movies, or those of so long, are lost at most where a program is killed that updates.
 constexpr std::size_t kMostWaiting = 256;
-constexpr std::chrono::seconds kLongestWait{2};
+constexpr std::chrono::seconds kLongestUnwritten{2};
 
 // It comes from the path alone, so that every run and every share gives a movie the same.
 std::string NumberOfMovie(const std::string& path) {
@@ -149,7 +149,7 @@ void CatalogRun::Add(const std::filesystem::path& movie, catalog::Entry entry, b
     row["failed"] = hasFailed ? "1" : "0";
     waiting_.push_back(std::move(entry));
     if (waiting_.size() >= kMostWaiting ||
-        std::chrono::steady_clock::now() - written_ > kLongestWait) {
+        std::chrono::steady_clock::now() - written_ > kLongestUnwritten) {
         Write();
     }
 }

@@ -11,14 +11,14 @@
 #include <system_error>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Words.h"
 #include "text/Encodings.h"
 
 namespace cliphost {
 namespace {
 
-constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 constexpr std::size_t kMostBytes = std::size_t{256} << 20;
-constexpr std::size_t kMostColumns = 1000;
+constexpr std::size_t kMostCells = 1000;
 
 [[noreturn]] void Refuse(const std::filesystem::path& file, std::uint64_t row,
                          const std::string& reason, const std::string& hint = {}) {
@@ -92,8 +92,8 @@ private:
     }
 
     void Take(std::string_view cell) {
-        if (cells_.size() >= kMostColumns) {
-            Keep(fmt::format("it has more than {} cells", kMostColumns));
+        if (cells_.size() >= kMostCells) {
+            Keep(fmt::format("it has more than {} cells", kMostCells));
         } else if (cell.size() > kLongestCell) {
             Keep(fmt::format("cell {} is longer than {} bytes", cells_.size() + 1, kLongestCell));
         } else if (cell.find('\0') != std::string_view::npos ||

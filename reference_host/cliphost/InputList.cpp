@@ -7,12 +7,11 @@
 #include <memory>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/Words.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
 namespace {
-
-constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
 bool BeginsWith(std::string_view text, std::string_view start) {
     return text.substr(0, start.size()) == start;

@@ -17,7 +17,7 @@
 namespace cliphost {
 namespace {
 
-constexpr std::uint64_t kMostColumns = 10'000;
+constexpr std::uint64_t kMostInAnswer = 10'000;
 constexpr int kLevelOfDescription = 2;  // in the list of all entries
 
 void WriteColumns(Session& session, const Description& description, const MovieColumns& columns) {
@@ -121,12 +121,12 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     const std::uint64_t isPartial = fields.Number();
     answer.isPartial = isPartial != 0;
     const std::uint64_t columns = fields.Number();
-    for (std::uint64_t i = 0; i < std::min(columns, kMostColumns); ++i) {
+    for (std::uint64_t i = 0; i < std::min(columns, kMostInAnswer); ++i) {
         std::string name = fields.Text();
         std::string value = fields.Text();
         answer.columns.emplace_back(std::move(name), std::move(value));
     }
-    if (columns > kMostColumns || !fields.IsWhole() || isPartial > 1 || status > kExitCaller ||
+    if (columns > kMostInAnswer || !fields.IsWhole() || isPartial > 1 || status > kExitCaller ||
         !IsRoute(answer.route) || !IsRoute(problem.route) || (status != kExitFine && !problem)) {
         return false;
     }

@@ -32,7 +32,7 @@ using namespace std::chrono_literals;
 constexpr unsigned kPollWhereNothingTells = 10;  // seconds
 constexpr auto kLookForGone = 5s;
 // A signal that comes just before a wait is noticed after it.
-constexpr std::chrono::milliseconds kLongestWait = 1s;
+constexpr std::chrono::milliseconds kLongestRest = 1s;
 
 std::optional<host::system::FileState> StateOfFile(const std::filesystem::path& file) {
     std::error_code ignored;
@@ -81,7 +81,7 @@ public:
 
 private:
     void WaitAndLook() {
-        auto time = kLongestWait;
+        auto time = kLongestRest;
         if (const auto next = arrivals_.Next()) {
             const auto left =
                 std::chrono::duration_cast<std::chrono::milliseconds>(*next - Clock::now()) + 1ms;
