@@ -31,7 +31,6 @@
 namespace cliphost {
 namespace {
 
-constexpr char kVideoColumn[] = "Video";
 constexpr char kBetweenValues[] = " | ";  // of columns with the same name
 
 std::wstring Wide(const std::string& text) {
@@ -365,32 +364,13 @@ std::string RateOf(const aafRational_t& rate) {
     return rate.denominator == 1 ? std::to_string(rate.numerator) : ToText(rate);
 }
 
-std::string CodecOf(const Mobs& mobs, const ColumnValues& columns) {
-    for (const auto& [name, value] : columns) {
-        if (name == kVideoColumn) {
-            return value;
-        }
-    }
-    std::string codec;
-    if (mobs.file) {
-        ForEachDescriptorOf(*mobs.file, [&](IAAFEssenceDescriptor& descriptor) {
-            const auto picture = As<IAAFDigitalImageDescriptor>(&descriptor);
-            aafUID_t id{};
-            if (codec.empty() && picture && picture->GetCompression(&id) >= 0) {
-                codec = ToText(id);
-            }
-        });
-    }
-    return codec;
-}
-
 }  // namespace
 
 void SetColumns(IAAFFile* description, const MovieColumns& columns, const MovieColumns::Row& row) {
     Writer(description, columns, row).Write();
 }
 
-ColumnValues ColumnsOf(IAAFFile* description) {
+ColumnValues ColumnsOf(IAAFFile* description, const std::string& codec) {
     const Mobs mobs(description);
     ColumnValues values;
     if (!mobs.master) {
@@ -415,7 +395,7 @@ ColumnValues ColumnsOf(IAAFFile* description) {
         {"length", slots.empty() ? "" : std::to_string(slots[0].length)},
         {"rate", slots.empty() ? "" : RateOf(slots[0].rate)},
         {"tracks", fmt::format("{}, {}", Counted(pictures, "picture"), Counted(sounds, "sound"))},
-        {"codec", CodecOf(mobs, comments)}};
+        {"codec", codec}};
     for (const auto& [name, value] : comments) {
         if (!name.empty() && name[0] != '_' && UseOf(name) == ColumnUse::Comment) {
             values.emplace_back(name, value);

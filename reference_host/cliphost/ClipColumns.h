@@ -20,6 +20,7 @@ void SetColumns(IAAFFile* description, const MovieColumns& columns, const MovieC
 using ColumnValues = std::vector<std::pair<std::string, std::string>>;
 
 // What a description tells of its movie: the fixed columns but the path, then those of the bin.
-ColumnValues ColumnsOf(IAAFFile* description);
+// `codec`: that column's value.
+ColumnValues ColumnsOf(IAAFFile* description, const std::string& codec);
 
 }  // namespace cliphost

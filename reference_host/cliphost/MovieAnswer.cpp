@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/AafTree.h"
 #include "reference_host/cliphost/Fields.h"
 #include "reference_host/cliphost/JsonText.h"
+#include "reference_host/cliphost/MovieCodecs.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/RouteTaken.h"
@@ -55,7 +56,8 @@ MovieAnswer AnswerOf(Session& session, const Description& description, const Des
         WriteColumns(session, description, *form.columns);
     }
     if (!form.columnsOut.empty()) {
-        answer.columns = ColumnsOf(description.file.get());
+        answer.columns =
+            ColumnsOf(description.file.get(), CodecReader(session).ReadFirst(description.movie));
     }
     PathMaps maps = form.maps;
     MapLocators(description.file.get(), maps);

@@ -31,6 +31,16 @@ MovieCodecs CodecReader::Read(const std::filesystem::path& movie,
                                                        : FromLibrary(movie);
 }
 
+std::string CodecReader::ReadFirst(const std::filesystem::path& movie) {
+    const MovieCodecs codecs = Read(movie, header_parser::InspectHeaders(movie));
+    const std::vector<TrackCodec>& tracks =
+        codecs.pictures.empty() ? codecs.sounds : codecs.pictures;
+    if (tracks.empty()) {
+        return {};
+    }
+    return tracks[0].name.empty() ? tracks[0].code : tracks[0].name;
+}
+
 MovieCodecs CodecReader::FromHeader(const header_parser::Movie& movie) {
     MovieCodecs codecs;
     for (const Track& track : movie.tracks) {

@@ -33,6 +33,9 @@ public:
     explicit CodecReader(Session& session) : session_(session) {}
     MovieCodecs Read(const std::filesystem::path& movie, const header_parser::HeaderReport& header);
 
+    // The first picture's, or else the first sound's: for people, or else its code.
+    std::string ReadFirst(const std::filesystem::path& movie);
+
 private:
     MovieCodecs FromHeader(const header_parser::Movie& movie);
     MovieCodecs FromLibrary(const std::filesystem::path& movie);

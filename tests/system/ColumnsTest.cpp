@@ -120,6 +120,8 @@ TEST_F(Columns, ComeBackAsTheyWereWritten) {
     EXPECT_EQ(cells["p.mov"]["length"], "3");
     EXPECT_EQ(cells["p.mov"]["rate"], "25");
     EXPECT_EQ(cells["p.mov"]["codec"], "PNG");
+    EXPECT_EQ(cells["t.mov"]["codec"], "Photo - JPEG");
+    EXPECT_EQ(cells["m.m4a"]["codec"], "AAC");
     EXPECT_EQ(cells["s.mov"]["start timecode"], "");
     EXPECT_EQ(cells["s.mov"]["tracks"], "1 picture, 9 sounds");
     EXPECT_EQ(cells["s.mov"]["Audio Format"], "LPCM | LPCM | LPCM");
