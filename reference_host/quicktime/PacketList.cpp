@@ -195,7 +195,9 @@ std::vector<PacketEntry> ListPackets(AVFormatContext& input, int stream, bool in
             return indexed;
         }
         enough = isInOrder ? 1 : enough;
-        isInOrder = isInOrder || (!indexed.empty() && AreAllSync(indexed));
+        // The first packets tell, and of the rest what the library has seen in the index.
+        isInOrder =
+            isInOrder || (!indexed.empty() && AreAllSync(indexed) && of.codecpar->video_delay == 0);
     }
     const bool isDoubted = indexIsWhole && AreAllSync(indexed) && !IsCodedAlone(*of.codecpar);
     const auto syncs = isDoubted ? SyncTeller::Of(of) : nullptr;

@@ -68,28 +68,37 @@ void PictureOrder::TakeBackSyncs(std::size_t first, std::size_t end) {
         packets_[i].isSync = false;
     }
     isIntraOnly_ = isIntraOnly_ && first >= end;
-    FindStarts();
+    // Of pictures that are shown as they are decoded no others began there.
+    for (std::size_t i = first; i < end; ++i) {
+        if (const auto picture = PictureOfPacket(i)) {
+            pictures_[*picture].start = first - 1;
+        }
+    }
 }
 
 void PictureOrder::FindStarts() {
     if (!hasDisplayTimes_) {
         return;  // pictures are counted, from the first
     }
-    std::vector<std::size_t> syncBefore(packets_.size(), 0);
+    const auto shown = [this](std::size_t packet) { return packets_[packet].displayTime; };
+    // Those that are shown before all sync packets behind them: their times rise.
     std::vector<std::size_t> syncs;
+    std::size_t first = kNone;
     for (std::size_t i = 0; i < packets_.size(); ++i) {
         if (packets_[i].isSync) {
+            first = std::min(first, i);
+            while (!syncs.empty() && shown(syncs.back()) > shown(i)) {
+                syncs.pop_back();
+            }
             syncs.push_back(i);
         }
-        syncBefore[i] = syncs.size();
-    }
-    for (Picture& picture : pictures_) {
-        std::size_t at = syncBefore[picture.packet];
-        const ncfSInt64 shown = packets_[picture.packet].displayTime;
-        while (at > 1 && packets_[syncs[at - 1]].displayTime > shown) {
-            --at;
+        const auto picture = PictureOfPacket(i);
+        if (picture && first != kNone) {
+            const auto behind = std::upper_bound(
+                syncs.begin(), syncs.end(), shown(i),
+                [&](ncfSInt64 time, std::size_t sync) { return time < shown(sync); });
+            pictures_[*picture].start = behind == syncs.begin() ? first : *std::prev(behind);
         }
-        picture.start = at > 0 ? syncs[at - 1] : 0;
     }
 }
 

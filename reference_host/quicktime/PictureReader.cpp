@@ -74,6 +74,10 @@ NCFRESULT PictureReader::Read(std::size_t picture, std::shared_ptr<const AVFrame
     if (picture >= order_.PictureCount()) {
         return NMA_E_NODATA;
     }
+    // An empty sample shows the picture before it on.
+    while (picture > 0 && order_.Packet(order_.PacketOfPicture(picture)).size == 0) {
+        --picture;
+    }
     if (!codec_) {
         codec_ = OpenPictureDecoder(*input_->streams[stream_], DecoderUse::EveryPicture);
     }
@@ -178,7 +182,8 @@ bool PictureReader::Feed() {
             // A packet that the decoder refuses leaves its picture out; the
             // next may be good. What is left of one behind a file's end some
             // decoders take for a whole.
-            if (!marksCutPackets_ || (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0) {
+            const bool isWhole = !marksCutPackets_ || (packet_->flags & AV_PKT_FLAG_CORRUPT) == 0;
+            if (isWhole && packet_->size > 0) {
                 codec_->skip_frame = IsPassedOver(at) ? AVDISCARD_NONREF : AVDISCARD_DEFAULT;
                 if (at < order_.PacketCount() && order_.Packet(at).palette) {
                     PutPalette(*order_.Packet(at).palette, *packet_);

@@ -29,8 +29,8 @@ public:
         parser->key_frame = -1;
         parser->pict_type = AV_PICTURE_TYPE_NONE;
         parser_.Look(packet);
-        return parser->key_frame < 0 ? parser->pict_type == AV_PICTURE_TYPE_I
-                                     : parser->key_frame == 1;
+        // A point of recovery may lie at a picture that leans on others, too.
+        return parser->key_frame != 0 && parser->pict_type == AV_PICTURE_TYPE_I;
     }
 
 private:
@@ -82,7 +82,7 @@ public:
             bytes.Skip(2);
             const int lines = bytes.Word();
             bytes.Skip(2);
-            if (first != 0 || lines < height_) {
+            if (first != 0 || lines != height_) {
                 return false;
             }
         }
@@ -110,7 +110,8 @@ private:
                 return false;
             }
             bytes.Skip(std::ptrdiff_t{bytesOfUnit_} * (run < 0 ? 1 : run));
-            units = std::min(units + (run < 0 ? -run : run), unitsOfLine_);
+            // Of a line that is too long this is one too many.
+            units = std::min(units + (run < 0 ? -run : run), unitsOfLine_ + 1);
         }
     }
 

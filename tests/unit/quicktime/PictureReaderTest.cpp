@@ -3,9 +3,12 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <filesystem>
+#include <fstream>
 
 #include "reference_host/quicktime/OpenInput.h"
 #include "reference_host/quicktime/PictureReader.h"
+#include "tests/support/Quoted.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;
@@ -103,12 +106,26 @@ MadeMovie ClaimingAllSync(const MadeMovie& movie) {
 // Where decoding can begin, content tells, and nothing for some codecs.
 TEST(PictureReader, GivesTheSamePictureAfterAJumpWhereAllSamplesClaimToBeSync) {
     for (const char* const codec :
-         {"libx264 -bf 0 -pix_fmt yuv420p", "libx264 -bf 3 -pix_fmt yuv420p",
+         {"libx264 -bf 0 -pix_fmt yuv420p",
+          "libx264 -bf 3 -pix_fmt yuv420p",
           "libx264 -x264-params open-gop=1 -pix_fmt yuv420p",
-          "libx265 -bf 0 -x265-params log-level=none", "libx265 -bf 3 -x265-params log-level=none",
-          "mpeg2video", "mpeg2video -bf 2", "mpeg1video", "mpeg4", "mpeg4 -bf 2", "h263 -s 352x288",
-          "libvpx-vp9 -f mp4", "qtrle", "qtrle -pix_fmt argb", "qtrle -pix_fmt rgb555be",
-          "qtrle -pix_fmt gray", "rpza -s 480x272", "cinepak", "svq1 -s 352x288"}) {
+          "libx264 -bf 0 -x264-params intra-refresh=1:keyint=40 -pix_fmt yuv420p",
+          "libx265 -bf 0 -x265-params log-level=none",
+          "libx265 -bf 3 -x265-params log-level=none",
+          "mpeg2video",
+          "mpeg2video -bf 2",
+          "mpeg1video",
+          "mpeg4",
+          "mpeg4 -bf 2",
+          "h263 -s 352x288",
+          "libvpx-vp9 -f mp4",
+          "qtrle",
+          "qtrle -pix_fmt argb",
+          "qtrle -pix_fmt rgb555be",
+          "qtrle -pix_fmt gray",
+          "rpza -s 480x272",
+          "cinepak",
+          "svq1 -s 352x288"}) {
         SCOPED_TRACE(codec);
         const MadeMovie movie("-f lavfi -i testsrc2=s=96x64:r=25:d=3 -g 20 -c:v " +
                               std::string(codec));
@@ -128,6 +145,46 @@ TEST(PictureReader, GivesTheSamePictureAfterAJumpWhereAllSamplesClaimToBeSync) {
             EXPECT_EQ(Luma(*frame), pictures[i]) << i;
         }
     }
+}
+
+TEST(PictureReader, KnowsReorderedPicturesFarBehindTheFirst) {
+    const std::string source = "-f lavfi -i testsrc2=s=96x64:r=25:d=2 -g 20 -pix_fmt yuv420p ";
+    const MadeMovie plain(source + "-c:v libx264 -bf 0");
+    const MadeMovie reordered(source + "-c:v libx264 -bf 2");
+    const TestFolder folder;
+    std::filesystem::copy_file(plain.Path(), folder.path() / "1.mov");
+    std::filesystem::copy_file(reordered.Path(), folder.path() / "2.mov");
+    std::ofstream(folder.path() / "list") << "ffconcat version 1.0\nfile 1.mov\nfile 2.mov\n";
+    const MadeMovie both("-f concat -i " + Quoted(folder.path() / "list") + " -c copy");
+    const MadeMovie claiming = ClaimingAllSync(both);
+    const auto known = Open(both);
+    const auto reader = Open(claiming);
+    ASSERT_TRUE(known && reader);
+    std::shared_ptr<const AVFrame> frame, expected;
+    for (const std::size_t i : {62u, 63u, 65u, 80u, 99u, 10u}) {
+        ASSERT_EQ(known->Read(i, expected), NCF_OK) << i;
+        ASSERT_EQ(reader->Read(i, frame), NCF_OK) << i;
+        EXPECT_EQ(Luma(*frame), Luma(*expected)) << i;
+    }
+}
+
+// An empty sample shows the picture before it on.
+TEST(PictureReader, ShowsThePictureBeforeWhereASampleIsEmpty) {
+    const MadeMovie movie("-f lavfi -i testsrc2=s=96x64:r=25:d=1 -c:v mjpeg -g 1");
+    Bytes bytes = movie.Content();
+    const std::string sizes = "stsz";
+    const auto table = std::search(bytes.begin(), bytes.end(), sizes.begin(), sizes.end());
+    ASSERT_NE(table, bytes.end());
+    // Its name, version, common size, count, and 24 sizes before the last.
+    std::fill_n(table + 4 + 4 + 4 + 4 + 24 * 4, 4, std::uint8_t{0});
+    const MadeMovie emptied(bytes, ".mov");
+    const auto reader = Open(emptied);
+    ASSERT_TRUE(reader);
+    ASSERT_EQ(reader->Count(), 25u);
+    std::shared_ptr<const AVFrame> last, before;
+    ASSERT_EQ(reader->Read(24, last), NCF_OK);
+    ASSERT_EQ(reader->Read(23, before), NCF_OK);
+    EXPECT_EQ(Luma(*last), Luma(*before));
 }
 
 // Of pictures that are shown in another order all are looked at.
