@@ -29,8 +29,9 @@ public:
     bool IsWholeFrom(std::size_t picture, std::size_t start) const {
         return picture < pictures_.size() && pictures_[picture].start >= start;
     }
-    // Packets that were told as sync and are none, from `first` to before `end`; the one before them
-    // is one. For streams whose packets all were told as sync and are shown as they are decoded.
+    // Packets that were told as sync and are none, from `first` to before `end`; the one before
+    // them is one. For streams whose packets all were told as sync and are shown as they are
+    // decoded.
     void TakeBackSyncs(std::size_t first, std::size_t end);
     bool IsIntraOnly() const { return isIntraOnly_; }
     // Some containers do not tell when a packet is shown.
