@@ -11,9 +11,11 @@
 namespace cliphost {
 namespace {
 
+// A link that leads nowhere is there: what it leads to may not be mounted.
 bool IsGone(const std::filesystem::path& movie) {
     std::error_code ignored;
-    return std::filesystem::status(movie, ignored).type() == std::filesystem::file_type::not_found;
+    return std::filesystem::symlink_status(movie, ignored).type() ==
+           std::filesystem::file_type::not_found;
 }
 
 class GoneSearch {

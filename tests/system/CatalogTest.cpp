@@ -258,6 +258,21 @@ TEST_F(Catalogs, KeepWhatTheCallWouldNotHaveFound) {
     EXPECT_EQ(gone, 2);
 }
 
+TEST_F(Catalogs, KeepLinksThatLeadNowhere) {
+    for (const char* const name : {"in/a.mov", "disk/b.mov"}) {
+        Copy("png.mov", name);
+    }
+    std::filesystem::create_symlink(folder() / "disk/b.mov", folder() / "in/b.mov");
+    ExpectSays(Run("catalog in -o c.sqlite --extensions mov"), 0, "2 catalogued");
+    std::filesystem::remove_all(folder() / "disk");
+    for (const char* const call : {"in", "in/b.mov"}) {
+        Run("catalog " + std::string(call) + " -o c.sqlite --update --extensions mov");
+        EXPECT_EQ(Names(), (Rows{"in/a.mov", "in/b.mov"})) << call;
+    }
+    std::filesystem::remove(folder() / "in/b.mov");
+    ExpectSays(Run("catalog in -o c.sqlite --update --extensions mov"), 0, "1 gone\n");
+}
+
 TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
     Copy("png.mov", "in/a.mov");
     for (const std::string& content :
