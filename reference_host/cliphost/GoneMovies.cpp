@@ -18,6 +18,12 @@ bool IsGone(const std::filesystem::path& movie) {
            std::filesystem::file_type::not_found;
 }
 
+// Where its folder is not there, or empty, that may be one that is not mounted.
+bool IsGoneFromFolder(const std::filesystem::path& movie) {
+    std::error_code error;
+    return IsGone(movie) && !std::filesystem::is_empty(movie.parent_path(), error) && !error;
+}
+
 class GoneSearch {
 public:
     GoneSearch(const MoviesOptions& options, catalog::Catalog& catalog)
@@ -32,7 +38,8 @@ public:
         for (const std::string& start : {bytes, host::text::FileUrl(bytes)}) {
             for (const std::string& path : catalog_.PathsThatBegin(start)) {
                 const std::filesystem::path movie = PathOfMachinePath(path);
-                if (IsMeant(movie.lexically_relative(folder), asGiven) && IsGone(movie)) {
+                if (IsMeant(movie.lexically_relative(folder), asGiven) &&
+                    IsGoneFromFolder(movie)) {
                     gone_.insert(path);
                 }
             }
@@ -41,10 +48,7 @@ public:
 
     void LookAt(const std::filesystem::path& named) {
         const std::string path = AbsoluteMachinePath(named);
-        const std::filesystem::path folder = PathOfMachinePath(path).parent_path();
-        std::error_code error;
-        if (IsGone(named) && !std::filesystem::is_empty(folder, error) && !error &&
-            catalog_.Find(path)) {
+        if (IsGoneFromFolder(PathOfMachinePath(path)) && catalog_.Find(path)) {
             gone_.insert(path);
         }
     }

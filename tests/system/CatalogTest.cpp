@@ -230,6 +230,7 @@ TEST_F(Catalogs, KeepWhatTheCallWouldNotHaveFound) {
     for (const char* const name : {"in/b.mov", "in/m.mp4", "in/sub/s.mov"}) {
         std::filesystem::remove(folder() / name);
     }
+    Write(movies::Bytes(1, 'x'), "in/sub/notes");
     std::filesystem::remove_all(folder() / "sole");
     std::filesystem::create_directory(folder() / "sole");  // as where nothing is mounted
     // Neither endings nor folders within nor other shares are meant.
@@ -256,6 +257,20 @@ TEST_F(Catalogs, KeepWhatTheCallWouldNotHaveFound) {
         gone += std::stoi(count[1]);
     }
     EXPECT_EQ(gone, 2);
+}
+
+TEST_F(Catalogs, KeepFoldersWithinThatMayNotBeMounted) {
+    for (const char* const name : {"in/a.mov", "in/disk/b.mov", "in/other/c.mov", "in/d/e.mov"}) {
+        Copy("png.mov", name);
+    }
+    Run("catalog in --recursive -o c.sqlite");
+    for (const char* const name : {"in/disk", "in/other", "in/d/e.mov"}) {
+        std::filesystem::remove_all(folder() / name);
+    }
+    std::filesystem::create_directory(folder() / "in/disk");
+    Copy("png.mov", "in/d/f.mov");
+    ExpectSays(Run("catalog in --recursive -o c.sqlite --update"), 0, "1 as before, 1 gone\n");
+    EXPECT_EQ(Names(), (Rows{"in/a.mov", "in/d/f.mov", "in/disk/b.mov", "in/other/c.mov"}));
 }
 
 TEST_F(Catalogs, KeepLinksThatLeadNowhere) {
