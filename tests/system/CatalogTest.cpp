@@ -259,6 +259,42 @@ TEST_F(Catalogs, KeepWhatTheCallWouldNotHaveFound) {
     EXPECT_EQ(gone, 2);
 }
 
+// As where a disk goes away in the midst of a run.
+TEST_F(Catalogs, KeepAFolderThatGoesAwayDuringTheRun) {
+    for (const char* const name : {"in/a.mov", "in/b.mov", "in/sub/c.mov"}) {
+        Copy("png.mov", name);
+    }
+    Run("catalog in --recursive -o c.sqlite");
+    Copy("png.mov", "in/new.mov");
+    std::filesystem::remove(folder() / "in/b.mov");
+    for (const char* const left : {"", "notes"}) {
+        {
+            // The run waits where it would write what it has read.
+            Database other(folder() / "c.sqlite", Database::Access::Change);
+            other.Run("BEGIN IMMEDIATE");
+            RunCommand("cd " + Quoted(folder()) + "; rm -f told ended; { " +
+                       Quoted(ProgramFolder() / "cliphost") +
+                       " catalog in --recursive --update -o c.sqlite; echo >ended; } >told 2>&1 & "
+                       "sleep 2");
+            std::filesystem::rename(folder() / "in", folder() / "away");
+            std::filesystem::create_directory(folder() / "in");
+            if (*left) {
+                Write(movies::Bytes(1, 'x'), std::string("in/") + left);
+            }
+            other.Run("ROLLBACK");
+        }
+        RunCommand("cd " + Quoted(folder()) +
+                   "; for i in $(seq 600); do [ -e ended ] && break; sleep 0.1; done");
+        const std::string told = TextOf(folder() / "told");
+        EXPECT_NE(told.find("1 catalogued, 0 not, 2 as before, 0 gone\n"), std::string::npos)
+            << told;
+        EXPECT_EQ(Names(), (Rows{"in/a.mov", "in/b.mov", "in/new.mov", "in/sub/c.mov"}));
+        std::filesystem::remove_all(folder() / "in");
+        std::filesystem::rename(folder() / "away", folder() / "in");
+        Copy("aac.mov", "in/new.mov");  // to be read again
+    }
+}
+
 TEST_F(Catalogs, KeepFoldersWithinThatMayNotBeMounted) {
     for (const char* const name : {"in/a.mov", "in/disk/b.mov", "in/other/c.mov", "in/d/e.mov"}) {
         Copy("png.mov", name);
