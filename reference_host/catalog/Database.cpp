@@ -14,8 +14,9 @@ constexpr int kKindOfCode = 0xFF;  // the rest tells more
 
 int FlagsOf(Database::Access access) {
     switch (access) {
+        // Who reads may have to take back what a killed program has left half written. Where
+        // nobody may write, the library opens it for reading.
         case Database::Access::Read:
-            return SQLITE_OPEN_READONLY;
         case Database::Access::Change:
             return SQLITE_OPEN_READWRITE;
         default:
@@ -42,6 +43,14 @@ bool DatabaseError::IsReadOnly() const {
     return (code_ & kKindOfCode) == SQLITE_READONLY;
 }
 
+bool DatabaseError::IsHalfWritten() const {
+    return code_ == SQLITE_READONLY_ROLLBACK || code_ == SQLITE_READONLY_RECOVERY;
+}
+
+bool DatabaseError::HasMoved() const {
+    return code_ == SQLITE_READONLY_DBMOVED;
+}
+
 bool DatabaseError::CantOpen() const {
     return (code_ & kKindOfCode) == SQLITE_CANTOPEN;
 }
@@ -60,6 +69,9 @@ void Database::Closing::operator()(sqlite3* handle) const {
 Database::Database(const std::filesystem::path& file, Access access) {
     // A name of another form could mean something else than a file.
     Open(std::filesystem::absolute(file).c_str(), FlagsOf(access));
+    if (access == Access::Read) {
+        Run("PRAGMA query_only = ON");
+    }
 }
 
 Database::Database() {

@@ -24,6 +24,8 @@ public:
     bool IsNoDatabase() const;  // the file is of another kind
     bool IsDamaged() const;
     bool IsReadOnly() const;
+    bool IsHalfWritten() const;  // a killed program left it so, and we may not write
+    bool HasMoved() const;       // another file is in its place
     bool CantOpen() const;
     // What the system said of a write or another step; 0 where it said nothing.
     int SystemError() const;
@@ -39,6 +41,7 @@ class Statement;
 // bound. Throws a DatabaseError.
 class Database {
 public:
+    // Read: no statement changes it.
     enum class Access { Read, Change, Make };
     // Somebody else's lock is waited for so long.
     static constexpr int kPatience = 5000;  // milliseconds

@@ -43,6 +43,14 @@ Failure CatalogFailure(const std::filesystem::path& file, const DatabaseError& e
         return {kExitCaller, file, fmt::format("the catalog is damaged: {}", error.what()),
                 "make it anew, without --update"};
     }
+    if (error.IsHalfWritten()) {
+        return {kExitCaller, file,
+                "a program was killed that wrote to it, and what it began can't be taken back here",
+                "get permission to write to it and to its folder"};
+    }
+    if (error.HasMoved()) {
+        return {kExitCaller, file, "another run has replaced it", "start this one again"};
+    }
     if (error.IsReadOnly()) {
         return {kExitCaller, NotWritten(file, EACCES)};
     }
