@@ -27,6 +27,16 @@ bool IsThere(const std::filesystem::path& file) {
     return WithCatalog(file, [&] { return catalog::IsCatalog(file); });
 }
 
+// What a killed program leaves beside a catalog belongs to that one alone: the library would put it
+// into another.
+void RemoveLeftovers(const std::filesystem::path& catalog) {
+    for (const char* const ending : {"-journal", "-wal", "-shm"}) {
+        std::filesystem::path leftover = catalog;
+        std::error_code ignored;
+        std::filesystem::remove(leftover += ending, ignored);
+    }
+}
+
 }  // namespace
 
 Failure CatalogFailure(const std::filesystem::path& file, const DatabaseError& error) {
@@ -80,6 +90,7 @@ NewCatalog::NewCatalog(const std::filesystem::path& file)
 
 void NewCatalog::Finish() {
     catalog_.reset();
+    RemoveLeftovers(output_.PlaceOfOther());
     output_.Finish();
 }
 

@@ -39,6 +39,8 @@ public:
     // For somebody else who makes a file of his own: the name that he is to give
     // it, at which nothing is. Not for devices.
     const std::filesystem::path& NameForOther() const { return unfinished_->path(); }
+    // Where that is going to lie, behind links.
+    const std::filesystem::path& PlaceOfOther() const { return unfinished_->place(); }
     // Throws the Failure if the system lets nobody write there.
     void TryPlace();
     // Throws the Failure for what the system said.

@@ -351,6 +351,35 @@ TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
     EXPECT_EQ(FilesNamed("d.sqlite"), 0u);
 }
 
+// As a program leaves it that is killed while it writes.
+TEST_F(Catalogs, TakeNothingOfWhatLiesBesideAnOlderOne) {
+    for (const char* const name : {"in/a.mov", "other/b.mov"}) {
+        Copy("png.mov", name);
+    }
+    Run("catalog in -o c.sqlite");
+    {
+        Database killed(folder() / "c.sqlite", Database::Access::Change);
+        killed.Run("PRAGMA cache_size = 1; BEGIN; UPDATE movies SET name = 'half written'");
+        killed.Run(
+            "CREATE TABLE big (a); WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
+            "WHERE i < 200) INSERT INTO big SELECT zeroblob(2000) FROM n");
+        std::filesystem::copy_file(folder() / "c.sqlite", folder() / "d.sqlite");
+        std::filesystem::copy_file(folder() / "c.sqlite-journal", folder() / "left");
+    }
+    std::filesystem::copy_file(folder() / "left", folder() / "d.sqlite-journal");
+    // What is half written is taken back by whoever reads first.
+    ExpectSays(Run("find d.sqlite name:a"), 0, "in/a.mov: ");
+    for (const char* const file : {"c.sqlite", "new.sqlite"}) {
+        for (const char* const ending : {"-journal", "-wal", "-shm"}) {
+            std::filesystem::copy_file(folder() / "left", folder() / (file + std::string(ending)));
+        }
+        ExpectSays(Run("catalog other -o " + std::string(file)), 0, "1 catalogued");
+        EXPECT_EQ(FilesNamed(file), 1u);
+        EXPECT_EQ(Names(file), Rows{"other/b.mov"});
+        EXPECT_EQ(Ask("SELECT * FROM pragma_integrity_check", file), Rows{"ok"});
+    }
+}
+
 TEST_F(Catalogs, WaitForALockAndThenSaySo) {
     Copy("png.mov", "in/a.mov");
     Run("catalog in -o c.sqlite");
