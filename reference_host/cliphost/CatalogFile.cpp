@@ -94,4 +94,13 @@ void NewCatalog::Finish() {
     output_.Finish();
 }
 
+void NewCatalog::FinishIfFree() {
+    catalog_.reset();
+    std::error_code error;
+    if (!std::filesystem::exists(output_.PlaceOfOther(), error)) {
+        RemoveLeftovers(output_.PlaceOfOther());
+    }
+    output_.FinishIfFree();
+}
+
 }  // namespace cliphost

@@ -96,7 +96,7 @@ CatalogRun::CatalogRun(Session& session, const CatalogOptions& options)
     }
     made_.emplace(file);
     if (options.update) {
-        made_->Finish();
+        made_->FinishIfFree();  // other runs may begin at the same time
         made_.reset();
         updated_.emplace(OpenCatalog(file, Catalog::For::Changing));
     }

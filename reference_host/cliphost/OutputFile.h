@@ -36,6 +36,8 @@ public:
     // Throws a Failure that tells why, or ReaderGone.
     void Write(const void* bytes, std::size_t size);
     void Finish();  // throws a Failure
+    // Lets a file stay that somebody else has put there in the meantime. Not for devices.
+    void FinishIfFree();
     // For somebody else who makes a file of his own: the name that he is to give
     // it, at which nothing is. Not for devices.
     const std::filesystem::path& NameForOther() const { return unfinished_->path(); }

@@ -23,6 +23,8 @@ public:
     const std::filesystem::path& place() const { return place_; }
     // Puts the whole file into its place; what was there before is gone.
     void TakePlace(std::error_code& error);
+    // The same where nothing is; what is there stays. Of two who try, one succeeds.
+    void TakePlaceIfFree(std::error_code& error);
 
 private:
     std::filesystem::path place_;

@@ -351,6 +351,24 @@ TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
     EXPECT_EQ(FilesNamed("d.sqlite"), 0u);
 }
 
+// All begin at once, where no catalog is yet.
+TEST_F(Catalogs, AreMadeBySeveralUpdatesTogether) {
+    for (int i = 0; i < 8; ++i) {
+        Copy("png.mov", "in/" + std::to_string(i) + ".mov");
+    }
+    for (int round = 0; round < 4; ++round) {
+        const CommandResult ran = RunCommand(
+            "cd " + Quoted(folder()) + "; for i in 1 2 3 4; do " +
+            Quoted(ProgramFolder() / "cliphost") +
+            " catalog in -o c.sqlite --update --jobs 1 --shard $i/4 2>&1 || echo failed & done; "
+            "wait");
+        EXPECT_EQ(ran.out.find("failed"), std::string::npos) << ran.out;
+        EXPECT_EQ(Names().size(), 8u) << ran.out;
+        EXPECT_EQ(FilesNamed("c.sqlite"), 1u);
+        std::filesystem::remove(folder() / "c.sqlite");
+    }
+}
+
 // As a program leaves it that is killed while it writes.
 TEST_F(Catalogs, TakeNothingOfWhatLiesBesideAnOlderOne) {
     for (const char* const name : {"in/a.mov", "other/b.mov"}) {
