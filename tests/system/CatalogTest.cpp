@@ -568,6 +568,26 @@ TEST_F(FindVerb, PrintsAMovieInEachLine) {
     EXPECT_NE(all.out.find("caf\\xE9.mov"), std::string::npos) << all.out;
 }
 
+TEST_F(FindVerb, KeepsNobodyFromWritingWhileItsReaderRests) {
+    Database database(folder() / "c.sqlite", Database::Access::Change);
+    database.Run(
+        "WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n WHERE i < 5000) INSERT "
+        "INTO movies (id, path, name, size, date, looked, settings, failed) SELECT i, '/' || i || "
+        "hex(zeroblob(50)), '', 1, 1, 1, '', 0 FROM n");
+    const std::string call =
+        "exec " + Quoted(ProgramFolder() / "cliphost") + " find " + Quoted(folder() / "c.sqlite");
+    std::FILE* const reader = popen(call.c_str(), "r");
+    ASSERT_TRUE(reader);
+    int c = std::fgetc(reader);  // from here on the pipe is full
+    EXPECT_NO_THROW(database.Run("DELETE FROM movies WHERE id = 1"));
+    int lines = 0;
+    for (; c != EOF; c = std::fgetc(reader)) {
+        lines += c == '\n' ? 1 : 0;
+    }
+    EXPECT_EQ(pclose(reader), 0);
+    EXPECT_EQ(lines, 5005);
+}
+
 TEST_F(FindVerb, EndsWithAStatusThatTells) {
     EXPECT_EQ(Run("find c.sqlite prores").status, 0);
     const CommandResult none = Run("find c.sqlite nowhere");
