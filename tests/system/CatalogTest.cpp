@@ -631,6 +631,7 @@ TEST_F(Catalogs, AnswerTheQueriesOfTheirPage) {
     }
     Copy("mjpeg.mov", "in/copy.mov");
     Write(movies::Bytes(100, 'x'), "in/bad.mov");
+    Write(movies::Bytes(100, 'x'), "in/worse.mov");
     Make("-f lavfi -i testsrc2=s=64x48:r=25:d=1 -c:v mpeg2video", "a.mxf");
     Run("catalog in a.mxf -o c.sqlite");
     int queries = 0;
@@ -639,6 +640,11 @@ TEST_F(Catalogs, AnswerTheQueriesOfTheirPage) {
         at += 7;
         const std::string sql = page.substr(at, page.find("```", at) - at);
         EXPECT_FALSE(Ask(sql).empty()) << sql;
+        if (sql.find("AS files") != std::string::npos) {  // what find calls copies
+            const Json copies = Json::parse(Run("find c.sqlite copy:yes --json").out)["movies"];
+            ASSERT_EQ(copies.size(), 2u);
+            EXPECT_EQ(Ask("SELECT files FROM (" + sql.substr(0, sql.find(';')) + ")"), Rows{"2"});
+        }
         ++queries;
     }
     EXPECT_EQ(queries, 10);
