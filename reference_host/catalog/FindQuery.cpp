@@ -202,18 +202,35 @@ void AddChoice(const Field& field, const std::string& value, Condition& all) {
     all.values.emplace_back(value);
 }
 
-// Timecodes compare as texts, since all have the same places; ';' counts as ':'.
+// Hours, and what may follow them, with all places that they are shown with; empty for anything
+// else. ';' counts as ':'. Frames of great rates have three places.
+std::string TimecodeIn(std::string_view text) {
+    constexpr std::size_t kParts = 4;
+    std::string timecode;
+    std::size_t part = 0;
+    for (; !text.empty() && part < kParts; ++part) {
+        const std::size_t size = std::min(text.find_first_not_of("0123456789"), text.size());
+        const bool ends = size == text.size();
+        if (size == 0 || size > (part + 1 < kParts ? 2u : 3u) ||
+            (!ends && text[size] != ':' && text[size] != ';') || size + 1 == text.size()) {
+            return {};
+        }
+        timecode += part == 0 ? "" : ":";
+        timecode += (size == 1 ? "0" : "") + std::string(text.substr(0, size));
+        text.remove_prefix(ends ? size : size + 1);
+    }
+    return text.empty() ? timecode : std::string();
+}
+
+// Timecodes compare as texts, since all have the same places.
 void AddTimecode(const Field& field, const std::string& value, Condition& all) {
     const Range range = RangeIn(value);
     const auto text = [&](const Range::End& end) {
-        std::string digits = end.text;
-        std::replace(digits.begin(), digits.end(), ';', ':');
-        const bool isFit = std::all_of(digits.begin(), digits.end(),
-                                       [](char c) { return (c >= '0' && c <= '9') || c == ':'; });
-        if (digits.empty() || !isFit) {
+        std::string timecode = TimecodeIn(end.text);
+        if (timecode.empty()) {
             Refuse(field, value, "is no timecode");
         }
-        return digits;
+        return timecode;
     };
     const std::string shown = fmt::format("replace({}, ';', ':')", field.on);
     // What begins with an included end is included, too.
