@@ -66,7 +66,7 @@ void Database::Closing::operator()(sqlite3* handle) const {
     sqlite3_close(handle);
 }
 
-Database::Database(const std::filesystem::path& file, Access access) {
+Database::Database(const std::filesystem::path& file, Access access) : file_(file) {
     // A name of another form could mean something else than a file.
     Open(std::filesystem::absolute(file).c_str(), FlagsOf(access));
     if (access == Access::Read) {
@@ -96,10 +96,10 @@ void Database::Open(const char* name, int flags) {
 void Database::Fail(int code) {
     const std::string words = handle_ ? sqlite3_errmsg(handle_.get()) : sqlite3_errstr(code);
     if (!handle_) {
-        throw DatabaseError(code, words);
+        throw DatabaseError(code, words, 0, file_);
     }
     throw DatabaseError(sqlite3_extended_errcode(handle_.get()), words,
-                        sqlite3_system_errno(handle_.get()));
+                        sqlite3_system_errno(handle_.get()), file_);
 }
 
 void Database::Run(const char* sql) {
@@ -136,6 +136,7 @@ void Database::CopyFrom(Database& other) {
     if (code != SQLITE_OK) {
         Fail(code);
     }
+    file_ = other.file_;
 }
 
 void Statement::Finishing::operator()(sqlite3_stmt* handle) const {

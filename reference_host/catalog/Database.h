@@ -8,6 +8,7 @@
 #include <stdexcept>
 #include <string>
 #include <string_view>
+#include <utility>
 
 struct sqlite3;
 struct sqlite3_stmt;
@@ -17,8 +18,12 @@ namespace catalog {
 // What the database library refused, in its words and with its code.
 class DatabaseError : public std::runtime_error {
 public:
-    DatabaseError(int code, const std::string& words, int systemError = 0)
-        : std::runtime_error(words), code_(code), systemError_(systemError) {}
+    DatabaseError(int code, const std::string& words, int systemError = 0,
+                  std::filesystem::path file = {})
+        : std::runtime_error(words),
+          code_(code),
+          systemError_(systemError),
+          file_(std::move(file)) {}
 
     bool IsLocked() const;      // somebody else holds it
     bool IsNoDatabase() const;  // the file is of another kind
@@ -29,10 +34,13 @@ public:
     bool CantOpen() const;
     // What the system said of a write or another step; 0 where it said nothing.
     int SystemError() const;
+    // As it was opened, of several; empty for one in memory.
+    const std::filesystem::path& file() const { return file_; }
 
 private:
     int code_;
     int systemError_;
+    std::filesystem::path file_;
 };
 
 class Statement;
@@ -55,7 +63,7 @@ public:
     Statement Prepare(std::string_view sql);
     // The number that a statement answers with; 0 for none.
     std::int64_t Number(std::string_view sql);
-    // Takes what another one holds in place of its own.
+    // Takes what another one holds in place of its own; errors name the other's file from then on.
     void CopyFrom(Database& other);
 
 private:
@@ -66,6 +74,7 @@ private:
     void Open(const char* name, int flags);
     [[noreturn]] void Fail(int code);
 
+    std::filesystem::path file_;
     std::unique_ptr<sqlite3, Closing> handle_;
 };
 

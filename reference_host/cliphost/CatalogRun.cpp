@@ -200,12 +200,26 @@ void CatalogRun::Finish(int read, int failed) {
     fmt::print("{}\n", summary);
 }
 
+namespace {
+
+// Of both, the one whose library refuses is at fault.
+void TakeCatalog(const std::filesystem::path& file, const std::filesystem::path& output,
+                 Catalog& merged) {
+    Catalog part = OpenCatalog(file, Catalog::For::Reading);
+    try {
+        merged.Take(part);
+    } catch (const catalog::DatabaseError& error) {
+        throw CatalogFailure(error.file() == file ? file : output, error);
+    }
+}
+
+}  // namespace
+
 void MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
                    const std::filesystem::path& output) {
     NewCatalog merged(output);
     for (const std::filesystem::path& file : catalogs) {
-        Catalog part = OpenCatalog(file, Catalog::For::Reading);
-        WithCatalog(file, [&] { merged.catalog().Take(part); });
+        TakeCatalog(file, output, merged.catalog());
     }
     const auto movies =
         WithCatalog(output, [&] { return static_cast<std::uint64_t>(merged.catalog().Count()); });

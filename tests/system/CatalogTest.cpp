@@ -433,6 +433,11 @@ TEST_F(Catalogs, LoseNothingOnAFullDisk) {
                    "disk/c.sqlite: not written: No space left on device");
         EXPECT_EQ(Names("disk/c.sqlite"), Rows{"in/a.mov"});
     }
+    // A merge blames what is full, and not what it reads.
+    Run("catalog " + Quoted(MadeMoviesFolder()) + " -o all.sqlite");
+    ExpectSays(Run("catalog --merge all.sqlite -o disk/c.sqlite"), 2,
+               "cliphost: disk/c.sqlite: not written: No space left on device");
+    EXPECT_EQ(Names("disk/c.sqlite"), Rows{"in/a.mov"});
     RunCommand("umount " + In("disk"));
 }
 
