@@ -4,6 +4,8 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/GoneMovies.h"
@@ -202,29 +204,48 @@ void CatalogRun::Finish(int read, int failed) {
 
 namespace {
 
-// Of both, the one whose library refuses is at fault.
-void TakeCatalog(const std::filesystem::path& file, const std::filesystem::path& output,
-                 Catalog& merged) {
+// Throws a Failure where that catalog is at fault, and what the library says where the merged one
+// is.
+void TakeCatalog(const std::filesystem::path& file, Catalog& merged) {
     Catalog part = OpenCatalog(file, Catalog::For::Reading);
     try {
         merged.Take(part);
     } catch (const catalog::DatabaseError& error) {
-        throw CatalogFailure(error.file() == file ? file : output, error);
+        if (error.file() != file) {
+            throw;
+        }
+        throw CatalogFailure(file, error);
     }
 }
 
 }  // namespace
 
-void MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
-                   const std::filesystem::path& output) {
+int MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
+                  const std::filesystem::path& output, int verbosity) {
     NewCatalog merged(output);
-    for (const std::filesystem::path& file : catalogs) {
-        TakeCatalog(file, output, merged.catalog());
+    int status = kExitFine;
+    std::size_t read = 0;
+    WithCatalog(output, [&] {
+        for (const std::filesystem::path& file : catalogs) {
+            try {
+                TakeCatalog(file, merged.catalog());
+                ++read;
+            } catch (const Failure& failure) {
+                status = std::max(status, failure.status());
+                TellProblem(failure.problem(), verbosity);
+            }
+        }
+    });
+    if (status != kExitFine && (read == 0 || merged.TakesPlace())) {
+        Notice("cliphost: {}: {}\n", host::DisplayPath(output),
+               merged.TakesPlace() ? "the catalog is left as it was" : "not written");
+        return status;
     }
     const auto movies =
         WithCatalog(output, [&] { return static_cast<std::uint64_t>(merged.catalog().Count()); });
     merged.Finish();
-    fmt::print("{} of {}\n", Counted(movies, "movie"), Counted(catalogs.size(), "catalog"));
+    fmt::print("{} of {}\n", Counted(movies, "movie"), Counted(read, "catalog"));
+    return status;
 }
 
 }  // namespace cliphost

@@ -67,7 +67,8 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
     verb->callback([&app, verb, &session, &status, options, isMerge] {
         NeedInputs(options->movies);
         if (*isMerge) {
-            MergeCatalogs(options->movies.paths, options->movies.together);
+            status =
+                MergeCatalogs(options->movies.paths, options->movies.together, session.verbosity);
             return;
         }
         TakeWorkerVerb(app, *verb, "catalog-for-parent", session, options->movies.workers);

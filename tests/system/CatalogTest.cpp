@@ -179,6 +179,22 @@ TEST_F(Catalogs, OfSharesMergeToThatOfASingleRun) {
     ExpectSays(Run("catalog --merge 1.sqlite missing.sqlite -o merged.sqlite"), 2,
                "missing.sqlite: there is no such file or folder");
     EXPECT_EQ(Names("merged.sqlite").size(), 12u);
+    // What can't be read doesn't keep the rest from being merged.
+    Write(movies::Bytes(4096, 'x'), "bad.sqlite");
+    std::string damaged = TextOf(folder() / "2.sqlite");
+    std::fill(damaged.begin() + 4096, damaged.end(), '\x55');
+    std::ofstream(folder() / "damaged.sqlite", std::ios::binary) << damaged;
+    const CommandResult rest =
+        Run("catalog --merge 1.sqlite bad.sqlite damaged.sqlite 2.sqlite 3.sqlite -o rest.sqlite");
+    ExpectSays(rest, 2, "12 movies of 3 catalogs\n");
+    ExpectSays(rest, 2, "bad.sqlite: is no SQLite file, so it is no catalog\n");
+    ExpectSays(rest, 2, "damaged.sqlite: the catalog is damaged: ");
+    EXPECT_EQ(Content("rest.sqlite"), Content());
+    ExpectSays(Run("catalog --merge 1.sqlite bad.sqlite -o rest.sqlite"), 2,
+               "rest.sqlite: the catalog is left as it was\n");
+    EXPECT_EQ(Content("rest.sqlite"), Content());
+    ExpectSays(Run("catalog --merge bad.sqlite -o none.sqlite"), 2, "none.sqlite: not written\n");
+    EXPECT_EQ(FilesNamed("none.sqlite"), 0u);
 }
 
 TEST_F(Catalogs, AreUpdatedWhereSomethingHasChanged) {
