@@ -3,6 +3,7 @@
 #include "reference_host/catalog/Catalog.h"
 
 #include <algorithm>
+#include <fstream>
 #include <system_error>
 
 #include "reference_host/catalog/Schema.h"
@@ -34,6 +35,20 @@ std::string InsertInto(const Table& table, std::size_t columns) {
 std::string SelectFrom(const Table& table) {
     return std::string("SELECT ") + table.key + ", " + table.columns + " FROM " + table.name +
            " WHERE " + table.key + " = ? ORDER BY " + table.order;
+}
+
+// Of the header of the library's files.
+constexpr std::size_t kHeaderSize = 100;
+constexpr char kFileMark[] = "SQLite format 3";  // with its byte of zero
+constexpr std::size_t kVersionAt = 60;
+constexpr std::size_t kApplicationAt = 68;
+
+std::int32_t BigEndian32(const char* bytes) {
+    std::uint32_t number = 0;
+    for (int i = 0; i < 4; ++i) {
+        number = number << 8 | static_cast<unsigned char>(bytes[i]);
+    }
+    return static_cast<std::int32_t>(number);
 }
 
 // Behind all texts that begin with this one.
@@ -220,8 +235,18 @@ bool IsCatalog(const std::filesystem::path& file) {
     if (!std::filesystem::exists(status)) {
         return false;
     }
-    Database database(file, Database::Access::Read);
-    VersionOf(database);
+    char header[kHeaderSize] = {};
+    std::ifstream stream(file, std::ios::binary);
+    if (!stream) {
+        Database(file, Database::Access::Read);  // tells why
+    }
+    stream.read(header, sizeof header);
+    const auto size = static_cast<std::size_t>(stream.gcount());
+    if (size > 0 && (size < sizeof header || std::string_view(header, sizeof kFileMark) !=
+                                                 std::string_view(kFileMark, sizeof kFileMark))) {
+        throw DatabaseError::NoDatabase();
+    }
+    CheckStamp({BigEndian32(header + kApplicationAt), BigEndian32(header + kVersionAt)});
     return true;
 }
 

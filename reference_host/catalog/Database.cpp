@@ -26,6 +26,10 @@ int FlagsOf(Database::Access access) {
 
 }  // namespace
 
+DatabaseError DatabaseError::NoDatabase() {
+    return {SQLITE_NOTADB, sqlite3_errstr(SQLITE_NOTADB)};
+}
+
 bool DatabaseError::IsLocked() const {
     const int kind = code_ & kKindOfCode;
     return kind == SQLITE_BUSY || kind == SQLITE_LOCKED;

@@ -25,6 +25,8 @@ public:
           systemError_(systemError),
           file_(std::move(file)) {}
 
+    static DatabaseError NoDatabase();
+
     bool IsLocked() const;      // somebody else holds it
     bool IsNoDatabase() const;  // the file is of another kind
     bool IsDamaged() const;

@@ -364,6 +364,7 @@ TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
                                    "catalog --merge c.sqlite -o d.sqlite"}) {
         ExpectSays(Run(call), 2, "c.sqlite: is a catalog of version 99, and this program knows");
     }
+    ExpectSays(Run("catalog in -o c.sqlite"), 2, "c.sqlite: is a catalog of version 99");
     EXPECT_EQ(FilesNamed("d.sqlite"), 0u);
 }
 
@@ -487,6 +488,12 @@ TEST_F(Catalogs, OfDamagedFilesSaySo) {
     ExpectSays(Run("catalog in -o c.sqlite --update"), 2, "make it anew, without --update\n");
     ExpectSays(Run("catalog in -o c.sqlite"), 0, "30 catalogued");
     EXPECT_EQ(Names().size(), 30u);
+    for (const std::uintmax_t size : {5000, 4096, 1000, 100}) {
+        std::filesystem::resize_file(folder() / "c.sqlite", size);
+        EXPECT_EQ(Run("catalog in -o c.sqlite --update").status, 2) << size;
+        ExpectSays(Run("catalog in -o c.sqlite"), 0, "30 catalogued");
+        EXPECT_EQ(Names().size(), 30u) << size;
+    }
 }
 
 // A run over many movies that a signal ends in the midst, once `begun` says so.

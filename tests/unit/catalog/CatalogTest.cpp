@@ -151,6 +151,12 @@ TEST_F(Catalogs, AreKnownFromOtherFiles) {
     EXPECT_FALSE(IsCatalog(folder / "missing"));
     Make("c");
     EXPECT_TRUE(IsCatalog(folder / "c"));
+    std::filesystem::resize_file(folder / "c", 100);  // the header alone
+    EXPECT_TRUE(IsCatalog(folder / "c"));
+    std::filesystem::resize_file(folder / "c", 99);
+    EXPECT_THROW(IsCatalog(folder / "c"), DatabaseError);
+    Database(folder / "other", Database::Access::Make).Run("CREATE TABLE movies (a)");
+    EXPECT_THROW(IsCatalog(folder / "other"), NoCatalog);
     EXPECT_THROW(IsCatalog(folder.Write("empty", "")), NoCatalog);
     EXPECT_THROW(IsCatalog(folder.Write("text", "some text that is long enough")), DatabaseError);
 }
