@@ -15,6 +15,7 @@
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "text/Encodings.h"
 
 namespace cliphost {
 namespace {
@@ -33,6 +34,13 @@ std::string NumberOfMovie(const std::string& path) {
         number = number << 8 | digest[i];
     }
     return std::to_string(number >> 1);  // SQLite's have 63 bits above nought
+}
+
+// As descriptions have it: bytes that are no UTF-8 are U+FFFD.
+std::string NameOfClip(const std::filesystem::path& movie) {
+    std::u32string name = encodings::FromUtf8(movie.stem().native());
+    std::replace_if(name.begin(), name.end(), encodings::IsSurrogate, U'\uFFFD');
+    return encodings::ToUtf8Lossy(name);
 }
 
 std::string Now() {
@@ -143,7 +151,7 @@ void CatalogRun::Add(const std::filesystem::path& movie, catalog::Entry entry, b
     const std::string path = AbsoluteMachinePath(movie);
     row["id"] = NumberOfMovie(path);
     row["path"] = path;
-    row.emplace("name", MachinePath(movie.stem()));
+    row.emplace("name", NameOfClip(movie));
     row["size"] = std::to_string(state->size);
     row["date"] = std::to_string(state->date);
     row["looked"] = Now();

@@ -143,6 +143,20 @@ TEST_F(Catalogs, OfTheSecondRouteKnowCodecsToo) {
     EXPECT_NE(Ask("SELECT route_reason FROM movies"), Rows{""});
 }
 
+TEST_F(Catalogs, NameWhatCantBeDescribedAsWhatCan) {
+    const std::string name = "caf\xE9\xFF x.mov";  // no UTF-8
+    Copy("png.mov", "in/" + name);
+    Write(movies::Bytes(100, 'x'), "other/" + name);
+    Run("catalog in other -o c.sqlite");
+    RunCommand("cd / && " + Quoted(ProgramFolder() / "cliphost") + " catalog " + In("in") + " " +
+               In("other") + " -o " + In("d.sqlite") + " 2>&1");
+    const std::string shown = "caf\xEF\xBF\xBD\xEF\xBF\xBD x";
+    for (const char* const catalog : {"c.sqlite", "d.sqlite"}) {
+        EXPECT_EQ(Ask("SELECT name, failed FROM movies ORDER BY failed", catalog),
+                  (Rows{shown + "|0", shown + "|1"}));
+    }
+}
+
 TEST_F(Catalogs, AreTheSameOfOneProcessAndOfSeveral) {
     for (const char* const name : {"png.mov", "aac.mov", "timecode_25.mov"}) {
         Copy(name, std::string("in/") + name);
