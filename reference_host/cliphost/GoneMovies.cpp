@@ -31,9 +31,7 @@ public:
 
     void LookIn(const MoviePlan::GivenFolder& given, const MoviePlan& plan) {
         const std::filesystem::path& asGiven = given.path;
-        std::error_code error;
-        const std::filesystem::path absolute = std::filesystem::absolute(asGiven, error);
-        const std::filesystem::path folder = (error ? asGiven : absolute / "").lexically_normal();
+        const std::filesystem::path folder = AbsolutePath(asGiven / "");
         std::vector<std::string> gone;
         // Movies whose names are no UTF-8 go by URLs.
         const std::string& bytes = folder.native();

@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "reference_host/cliphost/FolderTree.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Words.h"
 
 namespace cliphost {
@@ -184,7 +185,7 @@ private:
         Refuse(matches.noFiles);
         for (const std::filesystem::path& file : matches.files) {
             // The form of the paths that the module lists.
-            const auto movie = std::filesystem::absolute(file).lexically_normal();
+            const std::filesystem::path movie = AbsolutePath(file);
             AppendMovie(movie, file, MoviePlan::kFound,
                         [&] { return Keep(movie.native(), plan_.found_); });
         }

@@ -157,6 +157,21 @@ TEST_F(Catalogs, NameWhatCantBeDescribedAsWhatCan) {
     }
 }
 
+TEST_F(Catalogs, KnowWhereAPathBehindALinkLeads) {
+    Copy("png.mov", "real/a.mov");
+    std::filesystem::create_directory(folder() / "real/sub");
+    std::filesystem::create_directory_symlink("real/sub", folder() / "link");
+    for (const char* const input : {"link/../a.mov", "link/.. --extensions mov"}) {
+        ExpectSays(Run("catalog " + std::string(input) + " -o c.sqlite"), 0, "1 catalogued");
+        EXPECT_EQ(Names().size(), 1u);
+        for (const std::string& path : Ask("SELECT path FROM movies")) {
+            EXPECT_TRUE(std::filesystem::equivalent(path, folder() / "real/a.mov")) << path;
+        }
+        ExpectSays(Run("catalog " + std::string(input) + " -o c.sqlite --update"), 0,
+                   "0 catalogued, 0 not, 1 as before, 0 gone\n");
+    }
+}
+
 TEST_F(Catalogs, AreTheSameOfOneProcessAndOfSeveral) {
     for (const char* const name : {"png.mov", "aac.mov", "timecode_25.mov"}) {
         Copy(name, std::string("in/") + name);
