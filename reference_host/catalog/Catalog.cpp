@@ -75,7 +75,7 @@ struct Catalog::Statements {
     explicit Statements(Database& database)
         : find(database.Prepare("SELECT size, date, settings, failed FROM movies WHERE path = ?")),
           removeTexts(database.Prepare(kRemoveTexts)),
-          remove(database.Prepare("DELETE FROM movies WHERE path = ?")),
+          remove(database.Prepare("DELETE FROM movies WHERE path = ?1 OR id = ?2")),
           looked(database.Prepare("SELECT looked FROM movies WHERE path = ?")),
           fillTexts(database.Prepare(kFillTexts)) {
         for (std::size_t i = 0; i < kTableCount; ++i) {
@@ -86,10 +86,16 @@ struct Catalog::Statements {
         }
     }
 
-    // The child rows go with the movie.
-    void Remove(std::string_view path) {
-        removeTexts.Bind(1, path).Do();
-        remove.Bind(1, path).Do();
+    // The child rows go with the movie. `id`: of what comes in its place, which another path may
+    // have where somebody has changed paths.
+    void Remove(std::string_view path, std::string_view id = {}) {
+        for (Statement* const each : {&removeTexts, &remove}) {
+            each->Bind(1, path);
+            if (!id.empty()) {
+                each->Bind(2, id);
+            }
+            each->Do();
+        }
     }
 
     Statement find;
@@ -156,7 +162,7 @@ void Catalog::Put(const std::vector<Entry>& entries) {
     for (const Entry& entry : entries) {
         const Row& movie = entry.at("movies").at(0);
         const std::string& id = movie.at("id");
-        all.Remove(movie.at("path"));
+        all.Remove(movie.at("path"), id);
         for (std::size_t t = 0; t < kTableCount; ++t) {
             const auto rows = entry.find(kTables[t].name);
             if (rows == entry.end()) {
@@ -208,7 +214,7 @@ void Catalog::Take(Catalog& other) {
         if (isHere) {
             continue;
         }
-        all.Remove(path);
+        all.Remove(path, movies.Text(0));
         for (std::size_t t = 0; t < kTableCount; ++t) {
             Statement& row = from.tables[t].select;
             Statement& insert = all.tables[t].insert;

@@ -127,7 +127,7 @@ const Table kTables[] = {
 const std::size_t kTableCount = std::size(kTables);
 
 const char* const kRemoveTexts =
-    "DELETE FROM texts WHERE rowid = (SELECT id FROM movies WHERE path = ?1)";
+    "DELETE FROM texts WHERE rowid IN (SELECT id FROM movies WHERE path = ?1 OR id = ?2)";
 
 // The file's name is what stands behind the last slash.
 const char* const kFillTexts = R"sql(

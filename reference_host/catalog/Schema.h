@@ -56,8 +56,8 @@ extern const Table kTables[];
 extern const std::size_t kTableCount;
 
 // The texts that are searched are no ordinary table: a movie's row there is removed before the
-// movie
-// (?1: its path), and filled from all other tables (?1: its number).
+// movie (?1: its path, ?2: the number of what takes its place, or null), and filled from all other
+// tables (?1: its number).
 extern const char* const kRemoveTexts;
 extern const char* const kFillTexts;
 
