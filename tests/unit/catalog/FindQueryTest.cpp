@@ -260,6 +260,23 @@ TEST_F(Find, FieldsOfEachKind) {
     }
 }
 
+TEST_F(Find, LengthsAsTheyAreShown) {
+    catalog_.Put(
+        {Movie("/short.mov", 5,
+               {{"rate_numerator", "30000"}, {"rate_denominator", "1001"}, {"length", "2"}})});
+    const struct {
+        const char* query;
+        const char* ids;
+    } kQueries[] = {{"length:0.0667333", "5"}, {"length:<=0.0667333", "5"},
+                    {"length:<0.0667333", ""}, {"length:>0.0667333", "123"},
+                    {"length:0.066733", ""},   {"length:0.0667333..1.001", "235"},
+                    {"length:1.001", "23"},    {"length:1.00101", ""},
+                    {"length:10.0001", ""},    {"length:0", ""}};
+    for (const auto& query : kQueries) {
+        EXPECT_EQ(Ids(query.query), query.ids) << query.query;
+    }
+}
+
 // What the text search or SQL would understand is a text like any other.
 TEST_F(Find, HostileQueriesAsTexts) {
     for (const char* const query : {"NEAR",
