@@ -208,6 +208,12 @@ TEST_F(Catalogs, OfSharesMergeToThatOfASingleRun) {
     ExpectSays(Run("catalog --merge 1.sqlite missing.sqlite -o merged.sqlite"), 2,
                "missing.sqlite: there is no such file or folder");
     EXPECT_EQ(Names("merged.sqlite").size(), 12u);
+    for (const char* const option : {"--jobs 2", "--limit-seconds 5", "--limit-memory 500",
+                                     "--thumbnails", "--shard 1/2", "--recursive"}) {
+        ExpectSays(Run("catalog --merge 1.sqlite -o other.sqlite " + std::string(option)), 2,
+                   "--merge excludes --");
+    }
+    EXPECT_EQ(FilesNamed("other.sqlite"), 0u);
     // What can't be read doesn't keep the rest from being merged.
     Write(movies::Bytes(4096, 'x'), "bad.sqlite");
     std::string damaged = TextOf(folder() / "2.sqlite");
