@@ -27,6 +27,17 @@ bool IsThere(const std::filesystem::path& file) {
     return WithCatalog(file, [&] { return catalog::IsCatalog(file); });
 }
 
+// Hints for movies don't help.
+std::string HintForCatalog(const std::filesystem::path& file, const std::string& hint) {
+    std::error_code ignored;
+    if (std::filesystem::is_directory(file, ignored)) {
+        return "name a catalog in it";
+    }
+    const bool isEmpty =
+        std::filesystem::is_regular_file(file, ignored) && std::filesystem::is_empty(file, ignored);
+    return isEmpty ? "remove it, and make it anew" : hint;
+}
+
 // What a killed program leaves beside a catalog belongs to that one alone: the library would put it
 // into another.
 void RemoveLeftovers(const std::filesystem::path& catalog) {
@@ -76,6 +87,7 @@ Failure CatalogFailure(const std::filesystem::path& file, const catalog::NoCatal
 
 Catalog OpenCatalog(const std::filesystem::path& file, Catalog::For what) {
     if (Problem problem = WhyUnreadable(file)) {
+        problem.hint = HintForCatalog(file, problem.hint);
         throw Failure(kExitCaller, std::move(problem));
     }
     return WithCatalog(file, [&] { return Catalog(file, what); });

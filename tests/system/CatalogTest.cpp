@@ -385,6 +385,10 @@ TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
             EXPECT_EQ(TextOf(folder() / "other"), content);
         }
     }
+    std::ofstream(folder() / "empty").close();
+    ExpectSays(Run("catalog in -o empty --update"), 2,
+               "empty: the file is empty; remove it, and make it anew\n");
+    ExpectSays(Run("find in"), 2, "in: this is a folder; name a catalog in it\n");
     ExpectSays(Run("catalog in -o other"), 2, "other: is no SQLite file, so it is no catalog");
     Database(folder() / "foreign", Database::Access::Make).Run("CREATE TABLE movies (a)");
     ExpectSays(Run("catalog in -o foreign"), 2, "foreign: is no catalog of this program");
