@@ -28,12 +28,7 @@ constexpr std::chrono::seconds kLongestUnwritten{2};
 
 // It comes from the path alone, so that every run and every share gives a movie the same.
 std::string NumberOfMovie(const std::string& path) {
-    const Digest digest = DigestOf(path);
-    std::uint64_t number = 0;
-    for (std::size_t i = 0; i < sizeof number; ++i) {
-        number = number << 8 | digest[i];
-    }
-    return std::to_string(number >> 1);  // SQLite's have 63 bits above nought
+    return std::to_string(FirstBitsOf(DigestOf(path)) >> 1);  // SQLite's have 63 bits above nought
 }
 
 // As descriptions have it: bytes that are no UTF-8 are U+FFFD.
