@@ -146,6 +146,7 @@ TEST_F(Catalogs, OfTheSecondRouteKnowCodecsToo) {
 TEST_F(Catalogs, NameWhatCantBeDescribedAsWhatCan) {
     const std::string name = "caf\xE9\xFF x.mov";  // no UTF-8
     Copy("png.mov", "in/" + name);
+    std::filesystem::create_directory(folder() / "other");
     Write(movies::Bytes(100, 'x'), "other/" + name);
     Run("catalog in other -o c.sqlite");
     RunCommand("cd / && " + Quoted(ProgramFolder() / "cliphost") + " catalog " + In("in") + " " +
@@ -161,15 +162,13 @@ TEST_F(Catalogs, KnowWhereAPathBehindALinkLeads) {
     Copy("png.mov", "real/a.mov");
     std::filesystem::create_directory(folder() / "real/sub");
     std::filesystem::create_directory_symlink("real/sub", folder() / "link");
-    for (const char* const input : {"link/../a.mov", "link/.. --extensions mov"}) {
-        ExpectSays(Run("catalog " + std::string(input) + " -o c.sqlite"), 0, "1 catalogued");
-        EXPECT_EQ(Names().size(), 1u);
-        for (const std::string& path : Ask("SELECT path FROM movies")) {
-            EXPECT_TRUE(std::filesystem::equivalent(path, folder() / "real/a.mov")) << path;
-        }
-        ExpectSays(Run("catalog " + std::string(input) + " -o c.sqlite --update"), 0,
-                   "0 catalogued, 0 not, 1 as before, 0 gone\n");
-    }
+    const Rows real{"real/a.mov"};
+    ExpectSays(Run("catalog link/.. --extensions mov -o c.sqlite"), 0, "1 catalogued");
+    EXPECT_EQ(Names(), real);
+    ExpectSays(Run("catalog link/.. --extensions mov -o c.sqlite --update"), 0,
+               "0 catalogued, 0 not, 1 as before, 0 gone\n");
+    Run("catalog link/../a.mov -o named.sqlite");  // which the module doesn't find
+    EXPECT_EQ(Names("named.sqlite"), real);
 }
 
 TEST_F(Catalogs, AreTheSameOfOneProcessAndOfSeveral) {
