@@ -3,6 +3,7 @@
 #include "reference_host/catalog/Catalog.h"
 
 #include <algorithm>
+#include <fstream>
 #include <system_error>
 
 #include "reference_host/catalog/Schema.h"
@@ -36,6 +37,20 @@ std::string SelectFrom(const Table& table) {
            " WHERE " + table.key + " = ? ORDER BY " + table.order;
 }
 
+// Of the header of the library's files.
+constexpr std::size_t kHeaderSize = 100;
+constexpr char kFileMark[] = "SQLite format 3";  // with its byte of zero
+constexpr std::size_t kVersionAt = 60;
+constexpr std::size_t kApplicationAt = 68;
+
+std::int32_t BigEndian32(const char* bytes) {
+    std::uint32_t number = 0;
+    for (int i = 0; i < 4; ++i) {
+        number = number << 8 | static_cast<unsigned char>(bytes[i]);
+    }
+    return static_cast<std::int32_t>(number);
+}
+
 // Behind all texts that begin with this one.
 std::string Behind(std::string text) {
     while (!text.empty() && static_cast<unsigned char>(text.back()) == 0xFF) {
@@ -60,7 +75,7 @@ struct Catalog::Statements {
     explicit Statements(Database& database)
         : find(database.Prepare("SELECT size, date, settings, failed FROM movies WHERE path = ?")),
           removeTexts(database.Prepare(kRemoveTexts)),
-          remove(database.Prepare("DELETE FROM movies WHERE path = ?")),
+          remove(database.Prepare("DELETE FROM movies WHERE path = ?1 OR id = ?2")),
           looked(database.Prepare("SELECT looked FROM movies WHERE path = ?")),
           fillTexts(database.Prepare(kFillTexts)) {
         for (std::size_t i = 0; i < kTableCount; ++i) {
@@ -71,10 +86,16 @@ struct Catalog::Statements {
         }
     }
 
-    // The child rows go with the movie.
-    void Remove(std::string_view path) {
-        removeTexts.Bind(1, path).Do();
-        remove.Bind(1, path).Do();
+    // The child rows go with the movie. `id`: of what comes in its place, which another path may
+    // have where somebody has changed paths.
+    void Remove(std::string_view path, std::string_view id = {}) {
+        for (Statement* const each : {&removeTexts, &remove}) {
+            each->Bind(1, path);
+            if (!id.empty()) {
+                each->Bind(2, id);
+            }
+            each->Do();
+        }
     }
 
     Statement find;
@@ -141,7 +162,7 @@ void Catalog::Put(const std::vector<Entry>& entries) {
     for (const Entry& entry : entries) {
         const Row& movie = entry.at("movies").at(0);
         const std::string& id = movie.at("id");
-        all.Remove(movie.at("path"));
+        all.Remove(movie.at("path"), id);
         for (std::size_t t = 0; t < kTableCount; ++t) {
             const auto rows = entry.find(kTables[t].name);
             if (rows == entry.end()) {
@@ -193,7 +214,7 @@ void Catalog::Take(Catalog& other) {
         if (isHere) {
             continue;
         }
-        all.Remove(path);
+        all.Remove(path, movies.Text(0));
         for (std::size_t t = 0; t < kTableCount; ++t) {
             Statement& row = from.tables[t].select;
             Statement& insert = all.tables[t].insert;
@@ -220,8 +241,18 @@ bool IsCatalog(const std::filesystem::path& file) {
     if (!std::filesystem::exists(status)) {
         return false;
     }
-    Database database(file, Database::Access::Read);
-    VersionOf(database);
+    char header[kHeaderSize] = {};
+    std::ifstream stream(file, std::ios::binary);
+    if (!stream) {
+        Database(file, Database::Access::Read);  // tells why
+    }
+    stream.read(header, sizeof header);
+    const auto size = static_cast<std::size_t>(stream.gcount());
+    if (size > 0 && (size < sizeof header || std::string_view(header, sizeof kFileMark) !=
+                                                 std::string_view(kFileMark, sizeof kFileMark))) {
+        throw DatabaseError::NoDatabase();
+    }
+    CheckStamp({BigEndian32(header + kApplicationAt), BigEndian32(header + kVersionAt)});
     return true;
 }
 

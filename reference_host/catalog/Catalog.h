@@ -63,8 +63,8 @@ private:
     std::unique_ptr<Statements> statements_;
 };
 
-// Whether a catalog lies there, of whatever version. False where nothing does; throws NoCatalog or
-// a DatabaseError for anything else.
+// Whether a catalog lies there, by the header of the file alone: what is behind it may be damaged.
+// False where nothing does; throws NoCatalog or a DatabaseError for anything else.
 bool IsCatalog(const std::filesystem::path& file);
 
 }  // namespace catalog

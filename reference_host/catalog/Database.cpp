@@ -14,8 +14,9 @@ constexpr int kKindOfCode = 0xFF;  // the rest tells more
 
 int FlagsOf(Database::Access access) {
     switch (access) {
+        // Who reads may have to take back what a killed program has left half written. Where
+        // nobody may write, the library opens it for reading.
         case Database::Access::Read:
-            return SQLITE_OPEN_READONLY;
         case Database::Access::Change:
             return SQLITE_OPEN_READWRITE;
         default:
@@ -24,6 +25,10 @@ int FlagsOf(Database::Access access) {
 }
 
 }  // namespace
+
+DatabaseError DatabaseError::NoDatabase() {
+    return {SQLITE_NOTADB, sqlite3_errstr(SQLITE_NOTADB)};
+}
 
 bool DatabaseError::IsLocked() const {
     const int kind = code_ & kKindOfCode;
@@ -42,6 +47,14 @@ bool DatabaseError::IsReadOnly() const {
     return (code_ & kKindOfCode) == SQLITE_READONLY;
 }
 
+bool DatabaseError::IsHalfWritten() const {
+    return code_ == SQLITE_READONLY_ROLLBACK || code_ == SQLITE_READONLY_RECOVERY;
+}
+
+bool DatabaseError::HasMoved() const {
+    return code_ == SQLITE_READONLY_DBMOVED;
+}
+
 bool DatabaseError::CantOpen() const {
     return (code_ & kKindOfCode) == SQLITE_CANTOPEN;
 }
@@ -57,9 +70,12 @@ void Database::Closing::operator()(sqlite3* handle) const {
     sqlite3_close(handle);
 }
 
-Database::Database(const std::filesystem::path& file, Access access) {
+Database::Database(const std::filesystem::path& file, Access access) : file_(file) {
     // A name of another form could mean something else than a file.
     Open(std::filesystem::absolute(file).c_str(), FlagsOf(access));
+    if (access == Access::Read) {
+        Run("PRAGMA query_only = ON");
+    }
 }
 
 Database::Database() {
@@ -84,10 +100,10 @@ void Database::Open(const char* name, int flags) {
 void Database::Fail(int code) {
     const std::string words = handle_ ? sqlite3_errmsg(handle_.get()) : sqlite3_errstr(code);
     if (!handle_) {
-        throw DatabaseError(code, words);
+        throw DatabaseError(code, words, 0, file_);
     }
     throw DatabaseError(sqlite3_extended_errcode(handle_.get()), words,
-                        sqlite3_system_errno(handle_.get()));
+                        sqlite3_system_errno(handle_.get()), file_);
 }
 
 void Database::Run(const char* sql) {
@@ -124,6 +140,7 @@ void Database::CopyFrom(Database& other) {
     if (code != SQLITE_OK) {
         Fail(code);
     }
+    file_ = other.file_;
 }
 
 void Statement::Finishing::operator()(sqlite3_stmt* handle) const {

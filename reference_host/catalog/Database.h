@@ -8,6 +8,7 @@
 #include <stdexcept>
 #include <string>
 #include <string_view>
+#include <utility>
 
 struct sqlite3;
 struct sqlite3_stmt;
@@ -17,20 +18,31 @@ namespace catalog {
 // What the database library refused, in its words and with its code.
 class DatabaseError : public std::runtime_error {
 public:
-    DatabaseError(int code, const std::string& words, int systemError = 0)
-        : std::runtime_error(words), code_(code), systemError_(systemError) {}
+    DatabaseError(int code, const std::string& words, int systemError = 0,
+                  std::filesystem::path file = {})
+        : std::runtime_error(words),
+          code_(code),
+          systemError_(systemError),
+          file_(std::move(file)) {}
+
+    static DatabaseError NoDatabase();
 
     bool IsLocked() const;      // somebody else holds it
     bool IsNoDatabase() const;  // the file is of another kind
     bool IsDamaged() const;
     bool IsReadOnly() const;
+    bool IsHalfWritten() const;  // a killed program left it so, and we may not write
+    bool HasMoved() const;       // another file is in its place
     bool CantOpen() const;
     // What the system said of a write or another step; 0 where it said nothing.
     int SystemError() const;
+    // As it was opened, of several; empty for one in memory.
+    const std::filesystem::path& file() const { return file_; }
 
 private:
     int code_;
     int systemError_;
+    std::filesystem::path file_;
 };
 
 class Statement;
@@ -39,6 +51,7 @@ class Statement;
 // bound. Throws a DatabaseError.
 class Database {
 public:
+    // Read: no statement changes it.
     enum class Access { Read, Change, Make };
     // Somebody else's lock is waited for so long.
     static constexpr int kPatience = 5000;  // milliseconds
@@ -52,7 +65,7 @@ public:
     Statement Prepare(std::string_view sql);
     // The number that a statement answers with; 0 for none.
     std::int64_t Number(std::string_view sql);
-    // Takes what another one holds in place of its own.
+    // Takes what another one holds in place of its own; errors name the other's file from then on.
     void CopyFrom(Database& other);
 
 private:
@@ -63,6 +76,7 @@ private:
     void Open(const char* name, int flags);
     [[noreturn]] void Fail(int code);
 
+    std::filesystem::path file_;
     std::unique_ptr<sqlite3, Closing> handle_;
 };
 

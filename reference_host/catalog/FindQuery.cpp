@@ -12,7 +12,7 @@
 namespace catalog {
 namespace {
 
-enum class Kind { Words, Either, Number, Size, Rate, YesNo, Choice, Timecode, Columns };
+enum class Kind { Words, Either, Number, Seconds, Size, Rate, YesNo, Choice, Timecode, Columns };
 
 struct Field {
     const char* name;
@@ -36,7 +36,7 @@ constexpr Field kFields[] = {
     {"width", Kind::Number, "width", "width:>=1920", "of a frame, in pixels"},
     {"height", Kind::Number, "height", "height:1080", "of a frame, in pixels"},
     {"alpha", Kind::YesNo, "alpha", "alpha:yes", "whether the picture has alpha"},
-    {"length", Kind::Number, "seconds", "length:<10", "in seconds"},
+    {"length", Kind::Seconds, "seconds", "length:<10", "in seconds"},
     {"frames", Kind::Number, "length", "frames:1", "the length in edit units"},
     {"tc", Kind::Timecode, "start", "tc:10:00..11:00", "the start timecode, or how it begins"},
     {"channels", Kind::Number, "channels", "channels:>2", "of sound, in all tracks"},
@@ -136,10 +136,22 @@ std::optional<double> RateIn(std::string_view text) {
 }
 
 // Within half of the last place that people write: 23.98 is 24000/1001, and 24 is not.
-constexpr double kRateTolerance = 0.005;
+double RateTolerance(double) {
+    return 0.005;
+}
+
+double NoTolerance(double) {
+    return 0;
+}
+
+// Within half of the last of the six digits that are shown.
+double SecondsTolerance(double seconds) {
+    return seconds > 0 ? 0.5 * std::pow(10.0, std::floor(std::log10(seconds)) - 5) : 0;
+}
 
 void AddRange(const Field& field, const std::string& value,
-              std::optional<double> (*read)(std::string_view), double tolerance, Condition& all) {
+              std::optional<double> (*read)(std::string_view), double (*toleranceOf)(double),
+              Condition& all) {
     const Range range = RangeIn(value);
     const auto number = [&](const Range::End& end) {
         const std::optional<double> found = read(end.text);
@@ -150,15 +162,17 @@ void AddRange(const Field& field, const std::string& value,
     };
     std::string sql;
     if (range.least) {
-        const double slack = range.least->isIncluded ? -tolerance : tolerance;
+        const double least = number(*range.least);
+        const double slack = toleranceOf(least) * (range.least->isIncluded ? -1 : 1);
         sql = fmt::format("{} {} ?", field.on, range.least->isIncluded ? ">=" : ">");
-        all.values.emplace_back(number(*range.least) + slack);
+        all.values.emplace_back(least + slack);
     }
     if (range.most) {
-        const double slack = range.most->isIncluded ? tolerance : -tolerance;
+        const double most = number(*range.most);
+        const double slack = toleranceOf(most) * (range.most->isIncluded ? 1 : -1);
         sql += fmt::format("{}{} {} ?", sql.empty() ? "" : " AND ", field.on,
                            range.most->isIncluded ? "<=" : "<");
-        all.values.emplace_back(number(*range.most) + slack);
+        all.values.emplace_back(most + slack);
     }
     all.sql += sql;
 }
@@ -202,18 +216,35 @@ void AddChoice(const Field& field, const std::string& value, Condition& all) {
     all.values.emplace_back(value);
 }
 
-// Timecodes compare as texts, since all have the same places; ';' counts as ':'.
+// Hours, and what may follow them, with all places that they are shown with; empty for anything
+// else. ';' counts as ':'. Frames of great rates have three places.
+std::string TimecodeIn(std::string_view text) {
+    constexpr std::size_t kParts = 4;
+    std::string timecode;
+    std::size_t part = 0;
+    for (; !text.empty() && part < kParts; ++part) {
+        const std::size_t size = std::min(text.find_first_not_of("0123456789"), text.size());
+        const bool ends = size == text.size();
+        if (size == 0 || size > (part + 1 < kParts ? 2u : 3u) ||
+            (!ends && text[size] != ':' && text[size] != ';') || size + 1 == text.size()) {
+            return {};
+        }
+        timecode += part == 0 ? "" : ":";
+        timecode += (size == 1 ? "0" : "") + std::string(text.substr(0, size));
+        text.remove_prefix(ends ? size : size + 1);
+    }
+    return text.empty() ? timecode : std::string();
+}
+
+// Timecodes compare as texts, since all have the same places.
 void AddTimecode(const Field& field, const std::string& value, Condition& all) {
     const Range range = RangeIn(value);
     const auto text = [&](const Range::End& end) {
-        std::string digits = end.text;
-        std::replace(digits.begin(), digits.end(), ';', ':');
-        const bool isFit = std::all_of(digits.begin(), digits.end(),
-                                       [](char c) { return (c >= '0' && c <= '9') || c == ':'; });
-        if (digits.empty() || !isFit) {
+        std::string timecode = TimecodeIn(end.text);
+        if (timecode.empty()) {
             Refuse(field, value, "is no timecode");
         }
-        return digits;
+        return timecode;
     };
     const std::string shown = fmt::format("replace({}, ';', ':')", field.on);
     // What begins with an included end is included, too.
@@ -287,11 +318,13 @@ void AddTerm(const Term& term, Condition& all) {
         case Kind::Either:
             return AddEither(*field, term.value, all);
         case Kind::Number:
-            return AddRange(*field, term.value, NumberIn, 0, all);
+            return AddRange(*field, term.value, NumberIn, NoTolerance, all);
+        case Kind::Seconds:
+            return AddRange(*field, term.value, NumberIn, SecondsTolerance, all);
         case Kind::Size:
-            return AddRange(*field, term.value, SizeIn, 0, all);
+            return AddRange(*field, term.value, SizeIn, NoTolerance, all);
         case Kind::Rate:
-            return AddRange(*field, term.value, RateIn, kRateTolerance, all);
+            return AddRange(*field, term.value, RateIn, RateTolerance, all);
         case Kind::YesNo:
             return AddYesNo(*field, term.value, all);
         case Kind::Choice:

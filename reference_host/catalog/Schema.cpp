@@ -127,7 +127,7 @@ const Table kTables[] = {
 const std::size_t kTableCount = std::size(kTables);
 
 const char* const kRemoveTexts =
-    "DELETE FROM texts WHERE rowid = (SELECT id FROM movies WHERE path = ?1)";
+    "DELETE FROM texts WHERE rowid IN (SELECT id FROM movies WHERE path = ?1 OR id = ?2)";
 
 // The file's name is what stands behind the last slash.
 const char* const kFillTexts = R"sql(
@@ -143,16 +143,21 @@ SELECT id,
 FROM movies WHERE id = ?1
 )sql";
 
-std::int64_t VersionOf(Database& database, const Steps& steps) {
-    if (database.Number("PRAGMA application_id") != kApplicationId) {
+void CheckStamp(const Stamp& stamp, const Steps& steps) {
+    if (stamp.application != kApplicationId) {
         throw NoCatalog("is no catalog of this program");
     }
-    const std::int64_t version = database.Number("PRAGMA user_version");
-    if (version < 0 || version > static_cast<std::int64_t>(steps.count)) {
-        throw NoCatalog("is a catalog of version " + std::to_string(version) +
+    if (stamp.version < 0 || stamp.version > static_cast<std::int64_t>(steps.count)) {
+        throw NoCatalog("is a catalog of version " + std::to_string(stamp.version) +
                         ", and this program knows those up to " + std::to_string(steps.count));
     }
-    return version;
+}
+
+std::int64_t VersionOf(Database& database, const Steps& steps) {
+    const Stamp stamp{database.Number("PRAGMA application_id"),
+                      database.Number("PRAGMA user_version")};
+    CheckStamp(stamp, steps);
+    return stamp.version;
 }
 
 void BringUp(Database& database, const Steps& steps) {

@@ -32,6 +32,13 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+// What a file's header says that it is. Throws as VersionOf does.
+struct Stamp {
+    std::int64_t application;
+    std::int64_t version;
+};
+void CheckStamp(const Stamp& stamp, const Steps& steps = kSteps);
+
 // The version of a catalog. Throws NoCatalog where it is none, or of a newer program.
 std::int64_t VersionOf(Database& database, const Steps& steps = kSteps);
 // Does the steps that are missing, all or none; makes a catalog of an empty database.
@@ -49,8 +56,8 @@ extern const Table kTables[];
 extern const std::size_t kTableCount;
 
 // The texts that are searched are no ordinary table: a movie's row there is removed before the
-// movie
-// (?1: its path), and filled from all other tables (?1: its number).
+// movie (?1: its path, ?2: the number of what takes its place, or null), and filled from all other
+// tables (?1: its number).
 extern const char* const kRemoveTexts;
 extern const char* const kFillTexts;
 

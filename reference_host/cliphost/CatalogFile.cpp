@@ -27,6 +27,27 @@ bool IsThere(const std::filesystem::path& file) {
     return WithCatalog(file, [&] { return catalog::IsCatalog(file); });
 }
 
+// Hints for movies don't help.
+std::string HintForCatalog(const std::filesystem::path& file, const std::string& hint) {
+    std::error_code ignored;
+    if (std::filesystem::is_directory(file, ignored)) {
+        return "name a catalog in it";
+    }
+    const bool isEmpty =
+        std::filesystem::is_regular_file(file, ignored) && std::filesystem::is_empty(file, ignored);
+    return isEmpty ? "remove it, and make it anew" : hint;
+}
+
+// What a killed program leaves beside a catalog belongs to that one alone: the library would put it
+// into another.
+void RemoveLeftovers(const std::filesystem::path& catalog) {
+    for (const char* const ending : {"-journal", "-wal", "-shm"}) {
+        std::filesystem::path leftover = catalog;
+        std::error_code ignored;
+        std::filesystem::remove(leftover += ending, ignored);
+    }
+}
+
 }  // namespace
 
 Failure CatalogFailure(const std::filesystem::path& file, const DatabaseError& error) {
@@ -43,6 +64,14 @@ Failure CatalogFailure(const std::filesystem::path& file, const DatabaseError& e
         return {kExitCaller, file, fmt::format("the catalog is damaged: {}", error.what()),
                 "make it anew, without --update"};
     }
+    if (error.IsHalfWritten()) {
+        return {kExitCaller, file,
+                "a program was killed that wrote to it, and what it began can't be taken back here",
+                "get permission to write to it and to its folder"};
+    }
+    if (error.HasMoved()) {
+        return {kExitCaller, file, "another run has replaced it", "start this one again"};
+    }
     if (error.IsReadOnly()) {
         return {kExitCaller, NotWritten(file, EACCES)};
     }
@@ -58,6 +87,7 @@ Failure CatalogFailure(const std::filesystem::path& file, const catalog::NoCatal
 
 Catalog OpenCatalog(const std::filesystem::path& file, Catalog::For what) {
     if (Problem problem = WhyUnreadable(file)) {
+        problem.hint = HintForCatalog(file, problem.hint);
         throw Failure(kExitCaller, std::move(problem));
     }
     return WithCatalog(file, [&] { return Catalog(file, what); });
@@ -72,7 +102,17 @@ NewCatalog::NewCatalog(const std::filesystem::path& file)
 
 void NewCatalog::Finish() {
     catalog_.reset();
+    RemoveLeftovers(output_.PlaceOfOther());
     output_.Finish();
+}
+
+void NewCatalog::FinishIfFree() {
+    catalog_.reset();
+    std::error_code error;
+    if (!std::filesystem::exists(output_.PlaceOfOther(), error)) {
+        RemoveLeftovers(output_.PlaceOfOther());
+    }
+    output_.FinishIfFree();
 }
 
 }  // namespace cliphost

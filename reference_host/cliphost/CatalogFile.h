@@ -42,6 +42,8 @@ public:
     bool TakesPlace() const { return takesPlace_; }
     // Throws a Failure.
     void Finish();
+    // The same, but what another run has put there in the meantime stays.
+    void FinishIfFree();
 
 private:
     std::filesystem::path file_;

@@ -4,6 +4,8 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/GoneMovies.h"
@@ -13,6 +15,7 @@
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "text/Encodings.h"
 
 namespace cliphost {
 namespace {
@@ -25,12 +28,14 @@ constexpr std::chrono::seconds kLongestUnwritten{2};
 
 // It comes from the path alone, so that every run and every share gives a movie the same.
 std::string NumberOfMovie(const std::string& path) {
-    const Digest digest = DigestOf(path);
-    std::uint64_t number = 0;
-    for (std::size_t i = 0; i < sizeof number; ++i) {
-        number = number << 8 | digest[i];
-    }
-    return std::to_string(number >> 1);  // SQLite's have 63 bits above nought
+    return std::to_string(FirstBitsOf(DigestOf(path)) >> 1);  // SQLite's have 63 bits above nought
+}
+
+// As descriptions have it: bytes that are no UTF-8 are U+FFFD.
+std::string NameOfClip(const std::filesystem::path& movie) {
+    std::u32string name = encodings::FromUtf8(movie.stem().native());
+    std::replace_if(name.begin(), name.end(), encodings::IsSurrogate, U'\uFFFD');
+    return encodings::ToUtf8Lossy(name);
 }
 
 std::string Now() {
@@ -96,7 +101,7 @@ CatalogRun::CatalogRun(Session& session, const CatalogOptions& options)
     }
     made_.emplace(file);
     if (options.update) {
-        made_->Finish();
+        made_->FinishIfFree();  // other runs may begin at the same time
         made_.reset();
         updated_.emplace(OpenCatalog(file, Catalog::For::Changing));
     }
@@ -141,7 +146,7 @@ void CatalogRun::Add(const std::filesystem::path& movie, catalog::Entry entry, b
     const std::string path = AbsoluteMachinePath(movie);
     row["id"] = NumberOfMovie(path);
     row["path"] = path;
-    row.emplace("name", MachinePath(movie.stem()));
+    row.emplace("name", NameOfClip(movie));
     row["size"] = std::to_string(state->size);
     row["date"] = std::to_string(state->date);
     row["looked"] = Now();
@@ -200,17 +205,50 @@ void CatalogRun::Finish(int read, int failed) {
     fmt::print("{}\n", summary);
 }
 
-void MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
-                   const std::filesystem::path& output) {
+namespace {
+
+// Throws a Failure where that catalog is at fault, and what the library says where the merged one
+// is.
+void TakeCatalog(const std::filesystem::path& file, Catalog& merged) {
+    Catalog part = OpenCatalog(file, Catalog::For::Reading);
+    try {
+        merged.Take(part);
+    } catch (const catalog::DatabaseError& error) {
+        if (error.file() != file) {
+            throw;
+        }
+        throw CatalogFailure(file, error);
+    }
+}
+
+}  // namespace
+
+int MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
+                  const std::filesystem::path& output, int verbosity) {
     NewCatalog merged(output);
-    for (const std::filesystem::path& file : catalogs) {
-        Catalog part = OpenCatalog(file, Catalog::For::Reading);
-        WithCatalog(file, [&] { merged.catalog().Take(part); });
+    int status = kExitFine;
+    std::size_t read = 0;
+    WithCatalog(output, [&] {
+        for (const std::filesystem::path& file : catalogs) {
+            try {
+                TakeCatalog(file, merged.catalog());
+                ++read;
+            } catch (const Failure& failure) {
+                status = std::max(status, failure.status());
+                TellProblem(failure.problem(), verbosity);
+            }
+        }
+    });
+    if (status != kExitFine && (read == 0 || merged.TakesPlace())) {
+        Notice("cliphost: {}: {}\n", host::DisplayPath(output),
+               merged.TakesPlace() ? "the catalog is left as it was" : "not written");
+        return status;
     }
     const auto movies =
         WithCatalog(output, [&] { return static_cast<std::uint64_t>(merged.catalog().Count()); });
     merged.Finish();
-    fmt::print("{} of {}\n", Counted(movies, "movie"), Counted(catalogs.size(), "catalog"));
+    fmt::print("{} of {}\n", Counted(movies, "movie"), Counted(read, "catalog"));
+    return status;
 }
 
 }  // namespace cliphost

@@ -64,8 +64,10 @@ private:
     std::chrono::steady_clock::time_point written_ = std::chrono::steady_clock::now();
 };
 
-// Writes a catalog of what several have. Throws a Failure.
-void MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
-                   const std::filesystem::path& output);
+// Writes a catalog of what several have. One that can't be read is told, and the rest is written,
+// unless a catalog is there that would lose by that. Gives the status; throws a Failure where
+// nothing can be written.
+int MergeCatalogs(const std::vector<std::filesystem::path>& catalogs,
+                  const std::filesystem::path& output, int verbosity);
 
 }  // namespace cliphost

@@ -58,16 +58,18 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
     merge->excludes(update);
     AddForm(*verb, options->form);
     AddInputOptions(*verb, options->movies);
-    for (const char* const other :
-         {"--thumbnails", "--files-from", "--recursive", "--extensions", "--shard"}) {
+    AddWorkerOptions(*verb, options->movies.workers);
+    // It reads no movie.
+    for (const char* const other : {"--thumbnails", "--files-from", "--recursive", "--extensions",
+                                    "--shard", "--jobs", "--limit-seconds", "--limit-memory"}) {
         merge->excludes(other);
     }
-    AddWorkerOptions(*verb, options->movies.workers);
     AddCatalogForParent(app, session, status);
     verb->callback([&app, verb, &session, &status, options, isMerge] {
         NeedInputs(options->movies);
         if (*isMerge) {
-            MergeCatalogs(options->movies.paths, options->movies.together);
+            status =
+                MergeCatalogs(options->movies.paths, options->movies.together, session.verbosity);
             return;
         }
         TakeWorkerVerb(app, *verb, "catalog-for-parent", session, options->movies.workers);

@@ -68,6 +68,14 @@ std::optional<Digest> DigestOfFile(const std::filesystem::path& file) {
     return maker.Finish();
 }
 
+std::uint64_t FirstBitsOf(const Digest& digest) {
+    std::uint64_t number = 0;
+    for (std::size_t i = 0; i < sizeof number; ++i) {
+        number = number << 8 | digest[i];
+    }
+    return number;
+}
+
 std::string TextOf(const Digest& digest) {
     std::string text;
     for (const unsigned char byte : digest) {

@@ -138,13 +138,11 @@ std::string FactsOf(const Statement& row) {
     return facts;
 }
 
-void Print(const Statement& row, const FindOptions& options) {
+std::string LineOfMovie(const Statement& row, const FindOptions& options) {
     const std::filesystem::path path = PathOfMachinePath(row.Text(kPath));
-    if (options.paths) {
-        fmt::print("{}{}", path.native(), '\0');
-    } else {
-        fmt::print("{}: {}\n", host::DisplayPath(path), host::text::PrintableLines(FactsOf(row)));
-    }
+    return options.paths ? path.native() + '\0'
+                         : fmt::format("{}: {}\n", host::DisplayPath(path),
+                                       host::text::PrintableLines(FactsOf(row)));
 }
 
 int Find(const FindOptions& options) {
@@ -155,18 +153,22 @@ int Find(const FindOptions& options) {
     catalog::Catalog catalog = OpenCatalog(options.catalog, catalog::Catalog::For::Reading);
     return WithCatalog(options.catalog, [&] {
         ordered_json movies = ordered_json::array();
+        std::string lines;
         std::size_t count = 0;
         try {
             for (Statement select = Select(catalog, query); select.Step(); ++count) {
                 if (options.json) {
                     movies.push_back(JsonOf(select));
                 } else {
-                    Print(select, options);
+                    lines += LineOfMovie(select, options);
                 }
             }
         } catch (const catalog::QueryError& error) {
             throw Failure(kExitCaller, query, error.what());
         }
+        // Only now, when the catalog is free: who reads what is printed may take his time, and
+        // nobody could write meanwhile.
+        fmt::print("{}", lines);
         if (options.json) {
             PrintJson(schema::kFind,
                       {{"catalog", MachinePath(options.catalog)}, {"movies", std::move(movies)}});

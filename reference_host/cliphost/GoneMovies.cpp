@@ -11,9 +11,17 @@
 namespace cliphost {
 namespace {
 
+// A link that leads nowhere is there: what it leads to may not be mounted.
 bool IsGone(const std::filesystem::path& movie) {
     std::error_code ignored;
-    return std::filesystem::status(movie, ignored).type() == std::filesystem::file_type::not_found;
+    return std::filesystem::symlink_status(movie, ignored).type() ==
+           std::filesystem::file_type::not_found;
+}
+
+// Where its folder is not there, or empty, that may be one that is not mounted.
+bool IsGoneFromFolder(const std::filesystem::path& movie) {
+    std::error_code error;
+    return IsGone(movie) && !std::filesystem::is_empty(movie.parent_path(), error) && !error;
 }
 
 class GoneSearch {
@@ -21,28 +29,29 @@ public:
     GoneSearch(const MoviesOptions& options, catalog::Catalog& catalog)
         : options_(options), catalog_(catalog) {}
 
-    void LookIn(const std::filesystem::path& asGiven) {
-        std::error_code error;
-        const std::filesystem::path absolute = std::filesystem::absolute(asGiven, error);
-        const std::filesystem::path folder = (error ? asGiven : absolute / "").lexically_normal();
+    void LookIn(const MoviePlan::GivenFolder& given, const MoviePlan& plan) {
+        const std::filesystem::path& asGiven = given.path;
+        const std::filesystem::path folder = AbsolutePath(asGiven / "");
+        std::vector<std::string> gone;
         // Movies whose names are no UTF-8 go by URLs.
         const std::string& bytes = folder.native();
         for (const std::string& start : {bytes, host::text::FileUrl(bytes)}) {
             for (const std::string& path : catalog_.PathsThatBegin(start)) {
                 const std::filesystem::path movie = PathOfMachinePath(path);
-                if (IsMeant(movie.lexically_relative(folder), asGiven) && IsGone(movie)) {
-                    gone_.insert(path);
+                if (IsMeant(movie.lexically_relative(folder), asGiven) && IsGoneFromFolder(movie)) {
+                    gone.push_back(path);
                 }
             }
+        }
+        // Asked last: the folder may have gone away as a whole since it was listed.
+        if (!gone.empty() && HasMovies(given, plan)) {
+            gone_.insert(gone.begin(), gone.end());
         }
     }
 
     void LookAt(const std::filesystem::path& named) {
         const std::string path = AbsoluteMachinePath(named);
-        const std::filesystem::path folder = PathOfMachinePath(path).parent_path();
-        std::error_code error;
-        if (IsGone(named) && !std::filesystem::is_empty(folder, error) && !error &&
-            catalog_.Find(path)) {
+        if (IsGoneFromFolder(PathOfMachinePath(path)) && catalog_.Find(path)) {
             gone_.insert(path);
         }
     }
@@ -50,6 +59,16 @@ public:
     std::vector<std::string> Found() const { return {gone_.begin(), gone_.end()}; }
 
 private:
+    // Whether one that was found there is there still.
+    static bool HasMovies(const MoviePlan::GivenFolder& given, const MoviePlan& plan) {
+        bool has = !given.firstMovie.empty() && !IsGone(given.firstMovie);
+        for (std::size_t place = given.begin; !has && place < given.end; ++place) {
+            const MovieStep step = plan[place];
+            has = step.IsMovie() && !IsGone(step.movie);
+        }
+        return has;
+    }
+
     // `rest` is the way from the folder to the movie.
     bool IsMeant(const std::filesystem::path& rest, const std::filesystem::path& folder) const {
         const bool isWithin = options_.isRecursive || !rest.has_parent_path();
@@ -71,9 +90,7 @@ std::vector<std::string> GoneMovies(const MoviesOptions& options, const MoviePla
                                     catalog::Catalog& catalog) {
     GoneSearch search(options, catalog);
     for (const MoviePlan::GivenFolder& folder : plan.givenFolders()) {
-        if (folder.hasMovies) {
-            search.LookIn(folder.path);
-        }
+        search.LookIn(folder, plan);
     }
     for (std::size_t place = 0; place < plan.size(); ++place) {
         if (plan.IsNamed(place)) {

@@ -12,7 +12,11 @@ namespace cliphost {
 // both forms.
 std::string MachinePath(const std::filesystem::path& path);
 
-// The same of the absolute path: equal for all runs, wherever they are started.
+// An absolute path without "." and "..". Behind a link, ".." leads out of the folder that the link
+// leads to; it stays where the link leads nowhere.
+std::filesystem::path AbsolutePath(const std::filesystem::path& path);
+
+// The machine path of the absolute path: equal for all runs, wherever they are started.
 std::string AbsoluteMachinePath(const std::filesystem::path& path);
 // The path that a machine path stands for.
 std::filesystem::path PathOfMachinePath(const std::string& text);

@@ -4,7 +4,10 @@
 
 #include <fmt/format.h>
 
+#include <utility>
+
 #include "reference_host/cliphost/FolderTree.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Words.h"
 
 namespace cliphost {
@@ -43,13 +46,14 @@ public:
                         [&] { return Keep(path.native(), plan_.named_); });
             return;
         }
-        hasMovies_ = false;
+        firstMovie_.clear();
+        const std::size_t begin = plan_.size();
         if (options_.isRecursive) {
             AddTree(path);
         } else {
             AddFolder(path, false);
         }
-        plan_.givenFolders_.push_back({path, hasMovies_});
+        plan_.givenFolders_.push_back({path, std::exchange(firstMovie_, {}), begin, plan_.size()});
     }
 
 private:
@@ -67,7 +71,9 @@ private:
     void AppendMovie(const std::filesystem::path& movie, const std::filesystem::path& asGiven,
                      std::uint32_t list, const Place& place) {
         isEmpty_ = false;
-        hasMovies_ = true;
+        if (firstMovie_.empty()) {
+            firstMovie_ = movie;
+        }
         const unsigned number = hasNumbers_ ? NextNumber(movie) : 0;
         if (IsOfShare(asGiven)) {
             plan_.steps_.push_back({list, place()});
@@ -179,7 +185,7 @@ private:
         Refuse(matches.noFiles);
         for (const std::filesystem::path& file : matches.files) {
             // The form of the paths that the module lists.
-            const auto movie = std::filesystem::absolute(file).lexically_normal();
+            const std::filesystem::path movie = AbsolutePath(file);
             AppendMovie(movie, file, MoviePlan::kFound,
                         [&] { return Keep(movie.native(), plan_.found_); });
         }
@@ -196,8 +202,8 @@ private:
     const bool hasNumbers_;
     OutputNames ownNames_;
     OutputNames& names_;
-    bool isEmpty_ = true;  // the folder has neither a movie nor what is told as one
-    bool hasMovies_ = false;
+    bool isEmpty_ = true;               // the folder has neither a movie nor what is told as one
+    std::filesystem::path firstMovie_;  // of the folder at hand
 };
 
 MoviePlan::MoviePlan(Session& session, const MoviesOptions& options, const char* ending) {

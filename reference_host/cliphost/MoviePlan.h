@@ -80,7 +80,10 @@ public:
     // A folder of the command line or the list.
     struct GivenFolder {
         std::filesystem::path path;
-        bool hasMovies = false;  // of any share
+        std::filesystem::path firstMovie = {};  // of any share; empty: it has none
+        // The steps of this share that were found in it.
+        std::size_t begin = 0;
+        std::size_t end = 0;
     };
     const std::vector<GivenFolder>& givenFolders() const { return givenFolders_; }
     bool IsNamed(std::size_t place) const { return steps_[place].list == kNamed; }

@@ -65,6 +65,13 @@ void OutputFile::Finish() {
     }
 }
 
+void OutputFile::FinishIfFree() {
+    Check(stream_.Close());
+    std::error_code error;
+    unfinished_->TakePlaceIfFree(error);
+    Check(error.value());
+}
+
 void OutputFile::TryPlace() {
     Check(stream_.Open(unfinished_->path()));
 }

@@ -36,9 +36,13 @@ public:
     // Throws a Failure that tells why, or ReaderGone.
     void Write(const void* bytes, std::size_t size);
     void Finish();  // throws a Failure
+    // Lets a file stay that somebody else has put there in the meantime. Not for devices.
+    void FinishIfFree();
     // For somebody else who makes a file of his own: the name that he is to give
     // it, at which nothing is. Not for devices.
     const std::filesystem::path& NameForOther() const { return unfinished_->path(); }
+    // Where that is going to lie, behind links.
+    const std::filesystem::path& PlaceOfOther() const { return unfinished_->place(); }
     // Throws the Failure if the system lets nobody write there.
     void TryPlace();
     // Throws the Failure for what the system said.

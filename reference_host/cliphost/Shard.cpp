@@ -32,12 +32,7 @@ bool Shard::Holds(const std::string& path) const {
     if (IsWhole()) {
         return true;
     }
-    const Digest digest = DigestOf(path);
-    std::uint64_t number = 0;
-    for (std::size_t i = 0; i < sizeof number; ++i) {
-        number = number << 8 | digest[i];
-    }
-    return number % count_ == place_;
+    return FirstBitsOf(DigestOf(path)) % count_ == place_;
 }
 
 }  // namespace cliphost

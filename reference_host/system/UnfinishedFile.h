@@ -19,8 +19,12 @@ public:
     UnfinishedFile& operator=(const UnfinishedFile&) = delete;
 
     const std::filesystem::path& path() const { return path_; }
+    // Where it is to lie, behind links.
+    const std::filesystem::path& place() const { return place_; }
     // Puts the whole file into its place; what was there before is gone.
     void TakePlace(std::error_code& error);
+    // The same where nothing is; what is there stays. Of two who try, one succeeds.
+    void TakePlaceIfFree(std::error_code& error);
 
 private:
     std::filesystem::path place_;

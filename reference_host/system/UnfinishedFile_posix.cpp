@@ -109,4 +109,13 @@ void UnfinishedFile::TakePlace(std::error_code& error) {
     }
 }
 
+void UnfinishedFile::TakePlaceIfFree(std::error_code& error) {
+    std::filesystem::create_hard_link(path_, place_, error);
+    if (!error || error == std::errc::file_exists) {
+        error.clear();
+    } else if (!std::filesystem::exists(place_, error) && !error) {
+        TakePlace(error);  // not every file system has such links
+    }
+}
+
 }  // namespace host::system

@@ -143,6 +143,34 @@ TEST_F(Catalogs, OfTheSecondRouteKnowCodecsToo) {
     EXPECT_NE(Ask("SELECT route_reason FROM movies"), Rows{""});
 }
 
+TEST_F(Catalogs, NameWhatCantBeDescribedAsWhatCan) {
+    const std::string name = "caf\xE9\xFF x.mov";  // no UTF-8
+    Copy("png.mov", "in/" + name);
+    std::filesystem::create_directory(folder() / "other");
+    Write(movies::Bytes(100, 'x'), "other/" + name);
+    Run("catalog in other -o c.sqlite");
+    RunCommand("cd / && " + Quoted(ProgramFolder() / "cliphost") + " catalog " + In("in") + " " +
+               In("other") + " -o " + In("d.sqlite") + " 2>&1");
+    const std::string shown = "caf\xEF\xBF\xBD\xEF\xBF\xBD x";
+    for (const char* const catalog : {"c.sqlite", "d.sqlite"}) {
+        EXPECT_EQ(Ask("SELECT name, failed FROM movies ORDER BY failed", catalog),
+                  (Rows{shown + "|0", shown + "|1"}));
+    }
+}
+
+TEST_F(Catalogs, KnowWhereAPathBehindALinkLeads) {
+    Copy("png.mov", "real/a.mov");
+    std::filesystem::create_directory(folder() / "real/sub");
+    std::filesystem::create_directory_symlink("real/sub", folder() / "link");
+    const Rows real{"real/a.mov"};
+    ExpectSays(Run("catalog link/.. --extensions mov -o c.sqlite"), 0, "1 catalogued");
+    EXPECT_EQ(Names(), real);
+    ExpectSays(Run("catalog link/.. --extensions mov -o c.sqlite --update"), 0,
+               "0 catalogued, 0 not, 1 as before, 0 gone\n");
+    Run("catalog link/../a.mov -o named.sqlite");  // which the module doesn't find
+    EXPECT_EQ(Names("named.sqlite"), real);
+}
+
 TEST_F(Catalogs, AreTheSameOfOneProcessAndOfSeveral) {
     for (const char* const name : {"png.mov", "aac.mov", "timecode_25.mov"}) {
         Copy(name, std::string("in/") + name);
@@ -179,6 +207,28 @@ TEST_F(Catalogs, OfSharesMergeToThatOfASingleRun) {
     ExpectSays(Run("catalog --merge 1.sqlite missing.sqlite -o merged.sqlite"), 2,
                "missing.sqlite: there is no such file or folder");
     EXPECT_EQ(Names("merged.sqlite").size(), 12u);
+    for (const char* const option : {"--jobs 2", "--limit-seconds 5", "--limit-memory 500",
+                                     "--thumbnails", "--shard 1/2", "--recursive"}) {
+        ExpectSays(Run("catalog --merge 1.sqlite -o other.sqlite " + std::string(option)), 2,
+                   "--merge excludes --");
+    }
+    EXPECT_EQ(FilesNamed("other.sqlite"), 0u);
+    // What can't be read doesn't keep the rest from being merged.
+    Write(movies::Bytes(4096, 'x'), "bad.sqlite");
+    std::string damaged = TextOf(folder() / "2.sqlite");
+    std::fill(damaged.begin() + 4096, damaged.end(), '\x55');
+    std::ofstream(folder() / "damaged.sqlite", std::ios::binary) << damaged;
+    const CommandResult rest =
+        Run("catalog --merge 1.sqlite bad.sqlite damaged.sqlite 2.sqlite 3.sqlite -o rest.sqlite");
+    ExpectSays(rest, 2, "12 movies of 3 catalogs\n");
+    ExpectSays(rest, 2, "bad.sqlite: is no SQLite file, so it is no catalog\n");
+    ExpectSays(rest, 2, "damaged.sqlite: the catalog is damaged: ");
+    EXPECT_EQ(Content("rest.sqlite"), Content());
+    ExpectSays(Run("catalog --merge 1.sqlite bad.sqlite -o rest.sqlite"), 2,
+               "rest.sqlite: the catalog is left as it was\n");
+    EXPECT_EQ(Content("rest.sqlite"), Content());
+    ExpectSays(Run("catalog --merge bad.sqlite -o none.sqlite"), 2, "none.sqlite: not written\n");
+    EXPECT_EQ(FilesNamed("none.sqlite"), 0u);
 }
 
 TEST_F(Catalogs, AreUpdatedWhereSomethingHasChanged) {
@@ -230,6 +280,7 @@ TEST_F(Catalogs, KeepWhatTheCallWouldNotHaveFound) {
     for (const char* const name : {"in/b.mov", "in/m.mp4", "in/sub/s.mov"}) {
         std::filesystem::remove(folder() / name);
     }
+    Write(movies::Bytes(1, 'x'), "in/sub/notes");
     std::filesystem::remove_all(folder() / "sole");
     std::filesystem::create_directory(folder() / "sole");  // as where nothing is mounted
     // Neither endings nor folders within nor other shares are meant.
@@ -258,6 +309,71 @@ TEST_F(Catalogs, KeepWhatTheCallWouldNotHaveFound) {
     EXPECT_EQ(gone, 2);
 }
 
+// As where a disk goes away in the midst of a run.
+TEST_F(Catalogs, KeepAFolderThatGoesAwayDuringTheRun) {
+    for (const char* const name : {"in/a.mov", "in/b.mov", "in/sub/c.mov"}) {
+        Copy("png.mov", name);
+    }
+    Run("catalog in --recursive -o c.sqlite");
+    Copy("png.mov", "in/new.mov");
+    std::filesystem::remove(folder() / "in/b.mov");
+    for (const char* const left : {"", "notes"}) {
+        {
+            // The run waits where it would write what it has read.
+            Database other(folder() / "c.sqlite", Database::Access::Change);
+            other.Run("BEGIN IMMEDIATE");
+            RunCommand("cd " + Quoted(folder()) + "; rm -f told ended; { " +
+                       Quoted(ProgramFolder() / "cliphost") +
+                       " catalog in --recursive --update -o c.sqlite; echo >ended; } >told 2>&1 & "
+                       "sleep 2");
+            std::filesystem::rename(folder() / "in", folder() / "away");
+            std::filesystem::create_directory(folder() / "in");
+            if (*left) {
+                Write(movies::Bytes(1, 'x'), std::string("in/") + left);
+            }
+            other.Run("ROLLBACK");
+        }
+        RunCommand("cd " + Quoted(folder()) +
+                   "; for i in $(seq 600); do [ -e ended ] && break; sleep 0.1; done");
+        const std::string told = TextOf(folder() / "told");
+        EXPECT_NE(told.find("1 catalogued, 0 not, 2 as before, 0 gone\n"), std::string::npos)
+            << told;
+        EXPECT_EQ(Names(), (Rows{"in/a.mov", "in/b.mov", "in/new.mov", "in/sub/c.mov"}));
+        std::filesystem::remove_all(folder() / "in");
+        std::filesystem::rename(folder() / "away", folder() / "in");
+        Copy("aac.mov", "in/new.mov");  // to be read again
+    }
+}
+
+TEST_F(Catalogs, KeepFoldersWithinThatMayNotBeMounted) {
+    for (const char* const name : {"in/a.mov", "in/disk/b.mov", "in/other/c.mov", "in/d/e.mov"}) {
+        Copy("png.mov", name);
+    }
+    Run("catalog in --recursive -o c.sqlite");
+    for (const char* const name : {"in/disk", "in/other", "in/d/e.mov"}) {
+        std::filesystem::remove_all(folder() / name);
+    }
+    std::filesystem::create_directory(folder() / "in/disk");
+    Copy("png.mov", "in/d/f.mov");
+    ExpectSays(Run("catalog in --recursive -o c.sqlite --update"), 0, "1 as before, 1 gone\n");
+    EXPECT_EQ(Names(), (Rows{"in/a.mov", "in/d/f.mov", "in/disk/b.mov", "in/other/c.mov"}));
+}
+
+TEST_F(Catalogs, KeepLinksThatLeadNowhere) {
+    for (const char* const name : {"in/a.mov", "disk/b.mov"}) {
+        Copy("png.mov", name);
+    }
+    std::filesystem::create_symlink(folder() / "disk/b.mov", folder() / "in/b.mov");
+    ExpectSays(Run("catalog in -o c.sqlite --extensions mov"), 0, "2 catalogued");
+    std::filesystem::remove_all(folder() / "disk");
+    for (const char* const call : {"in", "in/b.mov"}) {
+        Run("catalog " + std::string(call) + " -o c.sqlite --update --extensions mov");
+        EXPECT_EQ(Names(), (Rows{"in/a.mov", "in/b.mov"})) << call;
+    }
+    std::filesystem::remove(folder() / "in/b.mov");
+    ExpectSays(Run("catalog in -o c.sqlite --update --extensions mov"), 0, "1 gone\n");
+}
+
 TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
     Copy("png.mov", "in/a.mov");
     for (const std::string& content :
@@ -268,6 +384,10 @@ TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
             EXPECT_EQ(TextOf(folder() / "other"), content);
         }
     }
+    std::ofstream(folder() / "empty").close();
+    ExpectSays(Run("catalog in -o empty --update"), 2,
+               "empty: the file is empty; remove it, and make it anew\n");
+    ExpectSays(Run("find in"), 2, "in: this is a folder; name a catalog in it\n");
     ExpectSays(Run("catalog in -o other"), 2, "other: is no SQLite file, so it is no catalog");
     Database(folder() / "foreign", Database::Access::Make).Run("CREATE TABLE movies (a)");
     ExpectSays(Run("catalog in -o foreign"), 2, "foreign: is no catalog of this program");
@@ -282,7 +402,55 @@ TEST_F(Catalogs, TakeThePlaceOfCatalogsAlone) {
                                    "catalog --merge c.sqlite -o d.sqlite"}) {
         ExpectSays(Run(call), 2, "c.sqlite: is a catalog of version 99, and this program knows");
     }
+    ExpectSays(Run("catalog in -o c.sqlite"), 2, "c.sqlite: is a catalog of version 99");
     EXPECT_EQ(FilesNamed("d.sqlite"), 0u);
+}
+
+// All begin at once, where no catalog is yet.
+TEST_F(Catalogs, AreMadeBySeveralUpdatesTogether) {
+    for (int i = 0; i < 8; ++i) {
+        Copy("png.mov", "in/" + std::to_string(i) + ".mov");
+    }
+    for (int round = 0; round < 4; ++round) {
+        const CommandResult ran = RunCommand(
+            "cd " + Quoted(folder()) + "; for i in 1 2 3 4; do " +
+            Quoted(ProgramFolder() / "cliphost") +
+            " catalog in -o c.sqlite --update --jobs 1 --shard $i/4 2>&1 || echo failed & done; "
+            "wait");
+        EXPECT_EQ(ran.out.find("failed"), std::string::npos) << ran.out;
+        EXPECT_EQ(Names().size(), 8u) << ran.out;
+        EXPECT_EQ(FilesNamed("c.sqlite"), 1u);
+        std::filesystem::remove(folder() / "c.sqlite");
+    }
+}
+
+// As a program leaves it that is killed while it writes.
+TEST_F(Catalogs, TakeNothingOfWhatLiesBesideAnOlderOne) {
+    for (const char* const name : {"in/a.mov", "other/b.mov"}) {
+        Copy("png.mov", name);
+    }
+    Run("catalog in -o c.sqlite");
+    {
+        Database killed(folder() / "c.sqlite", Database::Access::Change);
+        killed.Run("PRAGMA cache_size = 1; BEGIN; UPDATE movies SET name = 'half written'");
+        killed.Run(
+            "CREATE TABLE big (a); WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
+            "WHERE i < 200) INSERT INTO big SELECT zeroblob(2000) FROM n");
+        std::filesystem::copy_file(folder() / "c.sqlite", folder() / "d.sqlite");
+        std::filesystem::copy_file(folder() / "c.sqlite-journal", folder() / "left");
+    }
+    std::filesystem::copy_file(folder() / "left", folder() / "d.sqlite-journal");
+    // What is half written is taken back by whoever reads first.
+    ExpectSays(Run("find d.sqlite name:a"), 0, "in/a.mov: ");
+    for (const char* const file : {"c.sqlite", "new.sqlite"}) {
+        for (const char* const ending : {"-journal", "-wal", "-shm"}) {
+            std::filesystem::copy_file(folder() / "left", folder() / (file + std::string(ending)));
+        }
+        ExpectSays(Run("catalog other -o " + std::string(file)), 0, "1 catalogued");
+        EXPECT_EQ(FilesNamed(file), 1u);
+        EXPECT_EQ(Names(file), Rows{"other/b.mov"});
+        EXPECT_EQ(Ask("SELECT * FROM pragma_integrity_check", file), Rows{"ok"});
+    }
 }
 
 TEST_F(Catalogs, WaitForALockAndThenSaySo) {
@@ -320,6 +488,11 @@ TEST_F(Catalogs, LoseNothingOnAFullDisk) {
                    "disk/c.sqlite: not written: No space left on device");
         EXPECT_EQ(Names("disk/c.sqlite"), Rows{"in/a.mov"});
     }
+    // A merge blames what is full, and not what it reads.
+    Run("catalog " + Quoted(MadeMoviesFolder()) + " -o all.sqlite");
+    ExpectSays(Run("catalog --merge all.sqlite -o disk/c.sqlite"), 2,
+               "cliphost: disk/c.sqlite: not written: No space left on device");
+    EXPECT_EQ(Names("disk/c.sqlite"), Rows{"in/a.mov"});
     RunCommand("umount " + In("disk"));
 }
 
@@ -353,6 +526,12 @@ TEST_F(Catalogs, OfDamagedFilesSaySo) {
     ExpectSays(Run("catalog in -o c.sqlite --update"), 2, "make it anew, without --update\n");
     ExpectSays(Run("catalog in -o c.sqlite"), 0, "30 catalogued");
     EXPECT_EQ(Names().size(), 30u);
+    for (const std::uintmax_t size : {5000, 4096, 1000, 100}) {
+        std::filesystem::resize_file(folder() / "c.sqlite", size);
+        EXPECT_EQ(Run("catalog in -o c.sqlite --update").status, 2) << size;
+        ExpectSays(Run("catalog in -o c.sqlite"), 0, "30 catalogued");
+        EXPECT_EQ(Names().size(), 30u) << size;
+    }
 }
 
 // A run over many movies that a signal ends in the midst, once `begun` says so.
@@ -455,6 +634,26 @@ TEST_F(FindVerb, PrintsAMovieInEachLine) {
     EXPECT_NE(all.out.find("caf\\xE9.mov"), std::string::npos) << all.out;
 }
 
+TEST_F(FindVerb, KeepsNobodyFromWritingWhileItsReaderRests) {
+    Database database(folder() / "c.sqlite", Database::Access::Change);
+    database.Run(
+        "WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n WHERE i < 5000) INSERT "
+        "INTO movies (id, path, name, size, date, looked, settings, failed) SELECT i, '/' || i || "
+        "hex(zeroblob(50)), '', 1, 1, 1, '', 0 FROM n");
+    const std::string call =
+        "exec " + Quoted(ProgramFolder() / "cliphost") + " find " + Quoted(folder() / "c.sqlite");
+    std::FILE* const reader = popen(call.c_str(), "r");
+    ASSERT_TRUE(reader);
+    int c = std::fgetc(reader);  // from here on the pipe is full
+    EXPECT_NO_THROW(database.Run("DELETE FROM movies WHERE id = 1"));
+    int lines = 0;
+    for (; c != EOF; c = std::fgetc(reader)) {
+        lines += c == '\n' ? 1 : 0;
+    }
+    EXPECT_EQ(pclose(reader), 0);
+    EXPECT_EQ(lines, 5005);
+}
+
 TEST_F(FindVerb, EndsWithAStatusThatTells) {
     EXPECT_EQ(Run("find c.sqlite prores").status, 0);
     const CommandResult none = Run("find c.sqlite nowhere");
@@ -498,6 +697,7 @@ TEST_F(Catalogs, AnswerTheQueriesOfTheirPage) {
     }
     Copy("mjpeg.mov", "in/copy.mov");
     Write(movies::Bytes(100, 'x'), "in/bad.mov");
+    Write(movies::Bytes(100, 'x'), "in/worse.mov");
     Make("-f lavfi -i testsrc2=s=64x48:r=25:d=1 -c:v mpeg2video", "a.mxf");
     Run("catalog in a.mxf -o c.sqlite");
     int queries = 0;
@@ -506,6 +706,11 @@ TEST_F(Catalogs, AnswerTheQueriesOfTheirPage) {
         at += 7;
         const std::string sql = page.substr(at, page.find("```", at) - at);
         EXPECT_FALSE(Ask(sql).empty()) << sql;
+        if (sql.find("AS files") != std::string::npos) {  // what find calls copies
+            const Json copies = Json::parse(Run("find c.sqlite copy:yes --json").out)["movies"];
+            ASSERT_EQ(copies.size(), 2u);
+            EXPECT_EQ(Ask("SELECT files FROM (" + sql.substr(0, sql.find(';')) + ")"), Rows{"2"});
+        }
         ++queries;
     }
     EXPECT_EQ(queries, 10);

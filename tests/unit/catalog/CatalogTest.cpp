@@ -89,6 +89,19 @@ TEST_F(Catalogs, ReplaceWhatIsThereOfAPath) {
     EXPECT_FALSE(catalog.Find("/c.mov"));
 }
 
+// As somebody does in SQL whose movies have moved.
+TEST_F(Catalogs, TakeAMovieWhosePathWasChangedForAnother) {
+    Catalog catalog = Make("c"), from = Make("from");
+    catalog.Put({Whole("/old.mov", 1)});
+    catalog.database().Run("UPDATE movies SET path = '/new.mov'");
+    catalog.Put({Whole("/old.mov", 1)});
+    EXPECT_EQ(Answers(catalog, "SELECT path FROM movies"), Texts{"/old.mov"});
+    catalog.database().Run("UPDATE movies SET path = '/new.mov'");
+    from.Put({Whole("/old.mov", 1)});
+    catalog.Take(from);
+    EXPECT_EQ(Content(catalog), Content(from));
+}
+
 TEST_F(Catalogs, RemoveAllThatBelongsToAMovie) {
     Catalog catalog = Make("c");
     catalog.Put({Whole("/a.mov", 1), Whole("/b.mov", 2)});
@@ -101,7 +114,9 @@ TEST_F(Catalogs, RemoveAllThatBelongsToAMovie) {
 
 TEST_F(Catalogs, PutAllOrNone) {
     Catalog catalog = Make("c");
-    EXPECT_THROW(catalog.Put({Movie("/a", 1), Movie("/b", 1)}), DatabaseError);
+    Entry nameless = Movie("/b", 2);
+    nameless["movies"][0].erase("name");
+    EXPECT_THROW(catalog.Put({Movie("/a", 1), nameless}), DatabaseError);
     EXPECT_EQ(catalog.Count(), 0);
     catalog.Put({Movie("/a", 1)});
     EXPECT_EQ(catalog.Count(), 1);
@@ -151,6 +166,12 @@ TEST_F(Catalogs, AreKnownFromOtherFiles) {
     EXPECT_FALSE(IsCatalog(folder / "missing"));
     Make("c");
     EXPECT_TRUE(IsCatalog(folder / "c"));
+    std::filesystem::resize_file(folder / "c", 100);  // the header alone
+    EXPECT_TRUE(IsCatalog(folder / "c"));
+    std::filesystem::resize_file(folder / "c", 99);
+    EXPECT_THROW(IsCatalog(folder / "c"), DatabaseError);
+    Database(folder / "other", Database::Access::Make).Run("CREATE TABLE movies (a)");
+    EXPECT_THROW(IsCatalog(folder / "other"), NoCatalog);
     EXPECT_THROW(IsCatalog(folder.Write("empty", "")), NoCatalog);
     EXPECT_THROW(IsCatalog(folder.Write("text", "some text that is long enough")), DatabaseError);
 }

@@ -69,6 +69,36 @@ TEST(Database, TellsTheKindsOfErrors) {
     EXPECT_TRUE(errorOf(folder / "data", kRead, "INSERT INTO t VALUES (1)").IsReadOnly());
 }
 
+// The file and its journal as a program leaves them that is killed while it commits.
+TEST(Database, IsReadWhereAProgramWasKilledThatWrote) {
+    const TestFolder folder;
+    {
+        Database database(folder / "data", kMake);
+        database.Run("CREATE TABLE t (a); INSERT INTO t VALUES (1)");
+        // A small cache puts pages into the file before the commit.
+        database.Run("PRAGMA cache_size = 1; BEGIN; UPDATE t SET a = 2; CREATE TABLE big (a);");
+        database.Run(
+            "WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n WHERE i < 200) "
+            "INSERT INTO big SELECT zeroblob(2000) FROM n");
+        ASSERT_TRUE(std::filesystem::exists(folder / "data-journal"));
+        std::filesystem::copy_file(folder / "data", folder / "killed");
+        std::filesystem::copy_file(folder / "data-journal", folder / "killed-journal");
+        ASSERT_GT(std::filesystem::file_size(folder / "killed"), 20000u);
+    }
+    EXPECT_EQ(Database(folder / "killed", kRead).Number("SELECT a FROM t"), 1);
+    EXPECT_FALSE(std::filesystem::exists(folder / "killed-journal"));
+    EXPECT_LT(std::filesystem::file_size(folder / "killed"), 20000u);
+}
+
+TEST(Database, TellsWhyItIsReadOnly) {
+    const DatabaseError rollback(776, "");  // the library's numbers
+    EXPECT_TRUE(rollback.IsReadOnly() && rollback.IsHalfWritten() && !rollback.HasMoved());
+    EXPECT_TRUE(DatabaseError(264, "").IsHalfWritten());
+    const DatabaseError moved(1032, "");
+    EXPECT_TRUE(moved.IsReadOnly() && moved.HasMoved() && !moved.IsHalfWritten());
+    EXPECT_FALSE(DatabaseError(8, "").IsHalfWritten() || DatabaseError(8, "").HasMoved());
+}
+
 TEST(Database, MakesAFileOfAnyName) {
     const TestFolder folder;
     const auto before = std::filesystem::current_path();

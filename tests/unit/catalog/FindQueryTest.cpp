@@ -151,12 +151,17 @@ TEST(FindTerms, NameTheFieldsWhereOneIsUnknown) {
 }
 
 TEST(FindTerms, RefuseValuesThatAFieldCantHave) {
-    for (const char* const query :
-         {"rate:fast",    "rate:25/0",   "rate:1e3",  "rate:nan",   "rate:inf",
-          "width:",       "width:<",     "width:>=",  "width:..",   "width:10..",
-          "width:0x10",   "alpha:maybe", "alpha:YES", "route:road", "route:\"header library\"",
-          "route:",       "size:10X",    "size:G",    "tc:noon",    "tc:<",
-          "column:Scene", "column:=x",   "copy:1",    "warning:"}) {
+    for (const char* const query : {"rate:fast",     "rate:25/0",    "rate:1e3",
+                                    "rate:nan",      "rate:inf",     "width:",
+                                    "width:<",       "width:>=",     "width:..",
+                                    "width:10..",    "width:0x10",   "alpha:maybe",
+                                    "alpha:YES",     "route:road",   "route:\"header library\"",
+                                    "route:",        "size:10X",     "size:G",
+                                    "tc:noon",       "tc:<",         "tc:100",
+                                    "tc:010",        "tc:10:",       "tc::10",
+                                    "tc:10::1",      "tc:1:2:3:4:5", "tc:1:2:3:4:",
+                                    "tc:1:2:3:1000", "column:Scene", "column:=x",
+                                    "copy:1",        "warning:"}) {
         EXPECT_NE(WhyNot(query), "") << query;
     }
 }
@@ -221,6 +226,12 @@ TEST_F(Find, FieldsOfEachKind) {
                     {"size:1.5G", "1"},
                     {"size:<=2K", "234"},
                     {"tc:10", "1"},
+                    {"tc:1", "23"},
+                    {"tc:1:0", "23"},
+                    {"tc:1:0:0;0", "23"},
+                    {"tc:>=9", "1"},
+                    {"tc:1..2", "23"},
+                    {"tc:0", ""},
                     {"tc:01:00:00:00", "23"},
                     {"tc:01:00:00;00", "23"},
                     {"tc:>=02:00", "1"},
@@ -244,6 +255,23 @@ TEST_F(Find, FieldsOfEachKind) {
                     {"copy:yes", "23"},
                     {"-copy:yes", "14"},
                     {"codec:prores rate:25 alpha:no", "1"}};
+    for (const auto& query : kQueries) {
+        EXPECT_EQ(Ids(query.query), query.ids) << query.query;
+    }
+}
+
+TEST_F(Find, LengthsAsTheyAreShown) {
+    catalog_.Put(
+        {Movie("/short.mov", 5,
+               {{"rate_numerator", "30000"}, {"rate_denominator", "1001"}, {"length", "2"}})});
+    const struct {
+        const char* query;
+        const char* ids;
+    } kQueries[] = {{"length:0.0667333", "5"}, {"length:<=0.0667333", "5"},
+                    {"length:<0.0667333", ""}, {"length:>0.0667333", "123"},
+                    {"length:0.066733", ""},   {"length:0.0667333..1.001", "235"},
+                    {"length:1.001", "23"},    {"length:1.00101", ""},
+                    {"length:10.0001", ""},    {"length:0", ""}};
     for (const auto& query : kQueries) {
         EXPECT_EQ(Ids(query.query), query.ids) << query.query;
     }

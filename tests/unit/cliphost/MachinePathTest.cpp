@@ -4,6 +4,11 @@
 
 #include <gtest/gtest.h>
 
+#include <filesystem>
+
+#include "tests/support/TestFolder.h"
+
+using cliphost::AbsolutePath;
 using cliphost::MachinePath;
 
 TEST(MachinePath, IsThePathItselfWhereItIsText) {
@@ -21,4 +26,30 @@ TEST(MachinePath, IsAUrlWhereBytesAreNoText) {
 TEST(MachinePath, IsAUrlWhereThePathLooksLikeOne) {
     const std::string here = MachinePath("file:///a.mov");
     EXPECT_NE(here.find("/file%3A///a.mov"), std::string::npos) << here;
+}
+
+TEST(AbsolutePath, GoesWhereALinkLeads) {
+    const TestFolder folder;
+    const std::filesystem::path root = std::filesystem::canonical(folder.path()) / "";
+    std::filesystem::create_directories(root / "a/b");
+    std::filesystem::create_directory_symlink("a/b", root / "link");
+    std::filesystem::create_symlink("nowhere", root / "dead");
+    const struct {
+        const char* path;
+        const char* absolute;
+    } kPaths[] = {{"a/b/../x.mov", "a/x.mov"},
+                  {"./a/./x.mov", "a/x.mov"},
+                  {"link/../x.mov", "a/x.mov"},
+                  {"link/../../x.mov", "x.mov"},
+                  {"a/../link/x.mov", "link/x.mov"},
+                  {"link/../b/../x.mov", "a/x.mov"},
+                  {"none/../x.mov", "x.mov"},
+                  {"dead/../x.mov", "dead/../x.mov"},
+                  {"dead/../../x.mov", "dead/../../x.mov"},
+                  {"a//b/", "a/b/"}};
+    for (const auto& path : kPaths) {
+        EXPECT_EQ(AbsolutePath(root / path.path).native(), (root / path.absolute).native());
+    }
+    EXPECT_EQ(AbsolutePath("x.mov"), std::filesystem::current_path() / "x.mov");
+    EXPECT_EQ(AbsolutePath("/../x.mov"), "/x.mov");
 }

@@ -43,6 +43,23 @@ TEST(UnfinishedFile, IsRemovedWhenItCantTakeItsPlace) {
     EXPECT_EQ(folder.CountFiles(), 1u);
 }
 
+TEST(UnfinishedFile, LeavesWhatIsThereWhenAsked) {
+    const TestFolder folder;
+    for (const char* const content : {"first", "second"}) {
+        UnfinishedFile file(folder / "a.aaf");
+        WriteFile(file.path(), content);
+        std::error_code error;
+        file.TakePlaceIfFree(error);
+        EXPECT_FALSE(error);
+    }
+    EXPECT_EQ(ContentOf(folder / "a.aaf"), "first");
+    EXPECT_EQ(folder.CountFiles(), 1u);
+    UnfinishedFile file(folder / "missing" / "a.aaf");
+    std::error_code error;
+    file.TakePlaceIfFree(error);
+    EXPECT_TRUE(error);
+}
+
 // The longest name that a file can have leaves no room for an ending.
 TEST(UnfinishedFile, TakesAPlaceOfAnyName) {
     const TestFolder folder;
