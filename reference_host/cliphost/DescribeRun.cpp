@@ -26,6 +26,7 @@ using host::DisplayPath;
 using nlohmann::ordered_json;
 
 constexpr std::size_t kRoomForEnds = 64;
+constexpr char kEndingOfOutputs[] = ".aaf";
 
 // An entry of a list in JSON. `description` is JSON already.
 std::string EntryText(const ordered_json& head, const std::string& description) {
@@ -49,10 +50,38 @@ std::string EntryText(const ordered_json& head, const std::string& description) 
     return text;
 }
 
+bool IsPlaceOf(const std::filesystem::path& output, const std::filesystem::path& file) {
+    std::error_code error;
+    const auto whole = [&](const std::filesystem::path& path) {
+        return std::filesystem::weakly_canonical(std::filesystem::absolute(path, error), error);
+    };
+    const std::filesystem::path place = whole(output);
+    return (!error && place == whole(file)) || std::filesystem::equivalent(output, file, error);
+}
+
+// What an output would take the place of, though the call needs both.
+struct CallFile {
+    const char* what;
+    std::filesystem::path file;
+};
+
+void RefuseOutputOnto(const std::filesystem::path& output, const std::vector<CallFile>& files) {
+    if (output.empty() || OutputFile::IsDevice(output)) {
+        return;
+    }
+    for (const CallFile& other : files) {
+        if (!other.file.empty() && !OutputFile::IsDevice(other.file) &&
+            IsPlaceOf(output, other.file)) {
+            throw Failure(kExitCaller, output, fmt::format("this is {}", other.what),
+                          "name another file");
+        }
+    }
+}
+
 }  // namespace
 
 DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
-    : MoviesRun(session, options.movies, "describing", ".aaf"),
+    : MoviesRun(session, options.movies, "describing", kEndingOfOutputs),
       options_(options),
       maps_(options.form.maps) {
     if (!options.movies.together.empty()) {
@@ -61,8 +90,28 @@ DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
     }
 }
 
+void DescribeRun::RefuseOutputsOntoOthers() const {
+    const MoviesOptions& movies = options_.movies;
+    const std::filesystem::path& table = options_.form.columnsOut;
+    const std::vector<CallFile> read = {{"the list of movies", movies.list},
+                                        {"the table of --columns", options_.form.columnsFile},
+                                        {"the settings file", options_.settingsFile}};
+    RefuseOutputOnto(movies.file, read);
+    RefuseOutputOnto(movies.together, read);
+    RefuseOutputOnto(table, read);
+    RefuseOutputOnto(table, {{"the file of --aaf", movies.file}, {"the bin", movies.together}});
+    // The names of the outputs are found one after the other.
+    if (!table.empty() && !movies.outFolder.empty() &&
+        InSmallLetters(table.extension().string()) == kEndingOfOutputs &&
+        IsPlaceOf(std::filesystem::absolute(table).parent_path(), movies.outFolder)) {
+        throw Failure(kExitCaller, table, "a movie's output may have this name",
+                      "give the table another ending or folder");
+    }
+}
+
 // Which rows are for which movies is known before anything is read.
 void DescribeRun::Planned(const MoviePlan& plan) {
+    RefuseOutputsOntoOthers();
     const std::shared_ptr<const MovieColumns>& table = options_.form.columns;
     const std::filesystem::path& written = options_.form.columnsOut;
     const bool mayBeMovie = !written.empty() && host::system::NumberOf(written).has_value();

@@ -15,7 +15,8 @@ struct DescribeOptions {
     MoviesOptions movies;
     DescriptionForm form;
     bool stringout = false;
-    double editorRate = 25.0;  // frames per second
+    double editorRate = 25.0;            // frames per second
+    std::filesystem::path settingsFile;  // that was read; empty: none
 };
 
 // Describes all movies of the command line.
@@ -33,6 +34,7 @@ private:
     void Collect(const std::filesystem::path& movie, const std::filesystem::path& file) override;
     void Finish(int described, int failed) override;
     void Planned(const MoviePlan& plan) override;
+    void RefuseOutputsOntoOthers() const;
     void TellUnusedRows() const;
     void WriteColumns() const;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);

@@ -164,6 +164,9 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             }
             ReadColumns(options->form);
             options->editorRate = session.host.editorFrameRate.value_or(options->editorRate);
+            if (app.get_config_ptr()->count() > 0) {
+                options->settingsFile = app.get_config_ptr()->as<std::string>();
+            }
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));
             if (watch->isOn) {

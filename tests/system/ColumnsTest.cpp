@@ -210,6 +210,38 @@ TEST_F(Columns, NameWhatIsWrong) {
                2, "excludes");
 }
 
+TEST_F(Columns, TakeTheirPlaceFromNoOtherFile) {
+    const std::string movie = "describe -q " + Copy("png.mov", "png.mov");
+    const std::string table = Table("name,Scene\npng,1\n");
+    std::ofstream(folder() / "list") << (folder() / "png.mov").string() << "\n";
+    std::ofstream(folder() / "own.toml") << "v = 0\n";
+    std::filesystem::create_symlink("in.csv", folder() / "link.csv");
+    std::filesystem::create_directory(folder() / "out");
+    const auto expectKept = [&](const std::string& call, const std::string& words) {
+        const std::string before = Text("in.csv") + Text("list") + Text("own.toml");
+        ExpectSays(RunCliphost(call), 2, words);
+        EXPECT_EQ(Text("in.csv") + Text("list") + Text("own.toml"), before) << call;
+    };
+    const std::string to = "--columns-out ";
+    const std::string onto = folder().string() + "/./in.csv";
+    expectKept(movie + table + to + Quoted(onto), "this is the table of --columns");
+    expectKept(movie + table + to + In("link.csv"), "this is the table of --columns");
+    expectKept(movie + table + "--bin " + In("in.csv"), "this is the table of --columns");
+    expectKept(movie + table + "--aaf " + In("in.csv"), "this is the table of --columns");
+    const std::string list = "describe -q --files-from " + In("list") + " ";
+    expectKept(list + to + In("list"), "this is the list of movies");
+    expectKept(list + "--bin " + In("list"), "this is the list of movies");
+    const std::string own = "--config " + In("own.toml") + " ";
+    expectKept(movie + own + to + In("own.toml"), "this is the settings file");
+    expectKept(movie + "--aaf " + In("x") + " " + to + In("x"), "this is the file of --aaf");
+    expectKept(movie + "--bin " + In("x") + " " + to + In("out/../x"), "this is the bin");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "x"));
+    expectKept(movie + "--out-dir " + In("out") + " " + to + In("out/png.AAF"),
+               "a movie's output may have this name");
+    ExpectSays(RunCliphost(movie + "--out-dir " + In("out") + " " + to + In("out/png.csv")), 0,
+               "png.aaf");
+}
+
 // Another table makes other outputs.
 TEST_F(Columns, CountForSkipDone) {
     const std::string call =
