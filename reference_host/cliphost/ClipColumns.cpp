@@ -290,7 +290,10 @@ private:
             const auto clip = As<IAAFSourceClip>(segment);
             if (timecode && !hasTimecode) {
                 hasTimecode = true;
-                AddTimecode(*dictionary, *mob, *timecode, id, length, rate);
+                const aafTimecode_t counted =
+                    AddTimecode(*dictionary, *mob, *timecode, id, length, rate);
+                layout += fmt::format("\n{} {} {}", counted.startFrame, counted.fps,
+                                      counted.drop == kAAFTcDrop ? "drop" : "non-drop");
             } else if (clip) {
                 host::Ref<IAAFDataDef> data;
                 Check(slot.GetDataDef(data.Out()));
@@ -305,7 +308,7 @@ private:
             layout += fmt::format("\n{} {} {}/{} {}", id, length, rate.numerator, rate.denominator,
                                   DataOfSlot(slot).kind);
         });
-        // Movies of one reel with the same tracks lead to the same tape.
+        // Movies of one reel with the same tracks and count lead to the same tape.
         const aafMobID_t id = IdOf(*mob, layout);
         Check(mob->SetMobID(id));
         Check(header->AddMob(mob.get()));
@@ -314,8 +317,9 @@ private:
         }
     }
 
-    void AddTimecode(IAAFDictionary& dictionary, IAAFMob& mob, IAAFTimecode& like, aafSlotID_t id,
-                     aafLength_t length, const aafRational_t& rate) {
+    // Returns how it counts.
+    aafTimecode_t AddTimecode(IAAFDictionary& dictionary, IAAFMob& mob, IAAFTimecode& like,
+                              aafSlotID_t id, aafLength_t length, const aafRational_t& rate) {
         aafTimecode_t counted{};
         Check(like.GetTimecode(&counted));
         const auto timecode = New<IAAFTimecode>(dictionary, AUID_AAFTimecode);
@@ -324,6 +328,7 @@ private:
         Check(mob.AppendNewTimelineSlot(rate, As<IAAFSegment>(timecode.get()).get(), id, L"TC1", 0,
                                         timeline.Out()));
         Check(As<IAAFMobSlot>(timeline.get())->SetPhysicalNum(1));
+        return counted;
     }
 
     aafMobID_t IdOf(IAAFMob& mob, const std::string& layout) const {

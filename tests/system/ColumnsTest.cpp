@@ -5,6 +5,7 @@
 
 #include <fstream>
 #include <map>
+#include <set>
 #include <sstream>
 
 #include "reference_host/cliphost/CsvTable.h"
@@ -86,6 +87,26 @@ TEST_F(Columns, MakeOneTapeForMoviesOfAReel) {
     EXPECT_EQ(tapes, 1) << dump;
     // A timecode and a picture of the tape, and nothing of the two clips behind it.
     EXPECT_EQ(dump.find("SourceID = nil"), dump.rfind("SourceID = nil"));
+}
+
+// One tape can't count both with drops and without.
+TEST_F(Columns, MakeATapeForEachCountOfAReel) {
+    const std::string movies =
+        Copy("timecode_2997_drop.mov", "d.mov") + Copy("timecode_2997_nondrop.mov", "n.mov");
+    ASSERT_EQ(RunCliphost("describe -q --bin " + In("b.aaf") + " " + movies +
+                          Table("name,reel\nd,R1\nn,R1\n"))
+                  .status,
+              0);
+    const std::string dump = Dump("b.aaf");
+    std::set<std::string> drops;
+    int tapes = 0;
+    for (std::size_t at = 0; (at = dump.find("TapeDescriptor", at)) != std::string::npos; ++tapes) {
+        at = dump.find("Drop = ", at);
+        ASSERT_NE(at, std::string::npos) << dump;
+        drops.insert(dump.substr(at, dump.find('\n', at) - at));
+    }
+    EXPECT_EQ(tapes, 2) << dump;
+    EXPECT_EQ(drops.size(), 2u) << dump;
 }
 
 TEST_F(Columns, CountDroppedFrames) {
