@@ -151,7 +151,7 @@ ColumnValues ValuesOf(const std::vector<Comment>& comments) {
     ColumnValues values;
     for (const Comment& comment : comments) {
         const auto known = std::find_if(values.begin(), values.end(), [&](const auto& value) {
-            return value.first == comment.name;
+            return InSmallLetters(value.first) == InSmallLetters(comment.name);
         });
         if (known == values.end()) {
             values.emplace_back(comment.name, comment.text);
@@ -205,18 +205,22 @@ private:
         }
     }
 
-    // What is there already stays as it is. The names of comments are those of the module, or as
-    // the table writes them.
+    // What is there already stays as it is, its name too, which may differ in case from that of
+    // the table.
     void SetComment() {
-        const std::string& name = columns_.NameOf(*value_);
+        std::string name = columns_.NameOf(*value_);
+        const std::string small = InSmallLetters(name);
         const std::vector<Comment> comments = CommentsOf(*mobs_.master);
         for (const auto& [known, text] : ValuesOf(comments)) {
-            if (known == name && text == value_->text) {
-                return;
+            if (InSmallLetters(known) == small) {
+                if (text == value_->text) {
+                    return;
+                }
+                name = known;
             }
         }
         for (const Comment& comment : comments) {
-            if (comment.name == name) {
+            if (InSmallLetters(comment.name) == small) {
                 Check(mobs_.master->RemoveComment(comment.value.get()));
             }
         }

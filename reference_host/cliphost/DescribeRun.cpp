@@ -17,6 +17,7 @@
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/cliphost/WrittenTable.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -156,39 +157,34 @@ void DescribeRun::TellUnusedRows() const {
     }
 }
 
-// The fixed columns, then those of the bin in the order in which they came.
 void DescribeRun::WriteColumns() const {
     const std::filesystem::path& file = options_.form.columnsOut;
     if (IsStopped()) {
         throw Failure(kExitFile, file, "not written: not all movies were read");
     }
-    std::vector<std::string> header(std::begin(kFixedColumns), std::end(kFixedColumns));
-    std::map<std::string, std::size_t> places;
-    for (const std::string& name : header) {
-        places.emplace(name, places.size());
-    }
+    WrittenTable table;
     for (const auto& [movie, values] : columns_) {
-        for (const auto& [name, value] : values) {
-            if (places.emplace(name, header.size()).second) {
-                header.push_back(name);
-            }
-        }
+        table.AddNames(values);
     }
     OutputFile out(file);
     const auto write = [&](const std::vector<std::string>& cells) {
         const std::string line = CsvLine(cells);
         out.Write(line.data(), line.size());
     };
-    write(header);
+    write(table.header());
     for (const auto& [movie, values] : columns_) {
-        std::vector<std::string> cells(header.size());
-        cells[0] = MachinePath(std::filesystem::absolute(movie).lexically_normal());
-        for (const auto& [name, value] : values) {
-            cells[places[name]] = value;
-        }
-        write(cells);
+        write(table.Cells(MachinePath(std::filesystem::absolute(movie).lexically_normal()), values));
     }
     out.Finish();
+    const auto tellLeftOut = [&](std::size_t count, const char* thing, const std::string& why) {
+        if (count > 0) {
+            Notice("cliphost: {}: {} left out: {}\n", DisplayPath(file), Counted(count, thing), why);
+        }
+    };
+    tellLeftOut(table.columnsLeftOut(), "column",
+                fmt::format("a table has {} at most", kMostCells));
+    tellLeftOut(table.valuesLeftOut(), "value",
+                fmt::format("a cell has {} bytes at most", kLongestCell));
 }
 
 MovieAnswer DescribeRun::Answer(const MovieStep& step, const PlaceOfFile& place) {

@@ -157,6 +157,18 @@ TEST_F(Columns, ComeBackAsTheyWereWritten) {
     }
 }
 
+TEST_F(Columns, KeepTheNamesThatAreThere) {
+    const std::string movie = Copy("png.mov", "png.mov");
+    ASSERT_EQ(RunCliphost("describe -q " + movie + Table("name,VIDEO\npng,mine\n") + "--aaf " +
+                          In("a.aaf") + " --columns-out " + In("out.csv"))
+                  .status,
+              0);
+    const std::string dump = Dump("a.aaf");
+    EXPECT_TRUE(Holds(dump, "Name = \"Video\"\n      Value = \"mine\"")) << dump;
+    EXPECT_FALSE(Holds(dump, "VIDEO")) << dump;
+    ExpectSays(RunCliphost("describe -q " + movie + "--columns " + In("out.csv")), 0, "png.mov");
+}
+
 // Written back as it came, a table changes nothing.
 TEST_F(Columns, OfADescriptionChangeNoByteOfIt) {
     const std::string movies = Copy("timecode_25.mov", "t.mov") + Copy("three_sounds.mov", "s.mov");
