@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/SettingsText.h"
 
 namespace cliphost {
@@ -172,10 +173,13 @@ private:
             return;
         }
         try {
-            setting.option->add_result(setting.values);
+            for (const std::string& value : setting.values) {
+                setting.option->add_result(MarkedText(value));
+            }
             setting.option->run_callback();
         } catch (const CLI::Error& error) {
-            Refuse(file, setting.line, fmt::format("{}: {}", setting.Key(), error.what()), "");
+            Refuse(file, setting.line,
+                   fmt::format("{}: {}", setting.Key(), WithoutMarks(error.what())), "");
         } catch (const Failure& failure) {
             Refuse(file, setting.line,
                    fmt::format("{}: {}", setting.Key(), failure.problem().reason),
