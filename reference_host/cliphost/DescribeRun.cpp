@@ -116,7 +116,7 @@ void DescribeRun::Planned(const MoviePlan& plan) {
     const std::shared_ptr<const MovieColumns>& table = options_.form.columns;
     const std::filesystem::path& written = options_.form.columnsOut;
     const bool mayBeMovie = !written.empty() && host::system::NumberOf(written).has_value();
-    std::map<const MovieColumns::Row*, std::string> movies;
+    std::map<const MovieColumns::Row*, std::size_t> places;
     for (std::size_t i = 0; i < plan.size() && (table || mayBeMovie); ++i) {
         const MovieStep step = plan[i];
         if (!step.IsMovie()) {
@@ -126,15 +126,30 @@ void DescribeRun::Planned(const MoviePlan& plan) {
             RefuseOutputOntoMovie(written, step.movie);
         }
         const MovieColumns::Row* const row = table ? table->Find(step.movie) : nullptr;
-        const auto [first, isNew] = movies.emplace(row, step.movie);
-        if (row != nullptr && !isNew && first->second != step.movie) {
-            throw Failure(kExitCaller, table->file(),
-                          fmt::format("row {}: {} may be {} or {}", row->number, row->movie,
-                                      DisplayPath(std::filesystem::path(first->second)),
-                                      DisplayPath(std::filesystem::path(step.movie))),
-                          "give its path");
+        if (row == nullptr) {
+            continue;
         }
-        rowsUsed_.insert(row);
+        const auto [place, isFirstNow] = places.emplace(row, i);
+        auto& movie = movieOfRow_.emplace(row, step.movie).first->second;
+        std::error_code ignored;
+        if (movie == step.movie) {
+            continue;
+        }
+        if (isFirstNow && !std::filesystem::exists(movie, ignored)) {
+            movie = step.movie;  // which was moved since
+            continue;
+        }
+        const Failure clash(kExitCaller, table->file(),
+                            fmt::format("row {}: {} may be {} or {}", row->number, row->movie,
+                                        DisplayPath(std::filesystem::path(movie)),
+                                        DisplayPath(std::filesystem::path(step.movie))),
+                            "give its path");
+        if (options_.movies.names == nullptr) {
+            throw clash;
+        }
+        // A row of movies that come one after the other may be clear for all others.
+        RefuseMovie(place->second, clash);
+        RefuseMovie(i, clash);
     }
     if (!written.empty()) {
         OutputFile(written).TryPlace();
@@ -146,7 +161,7 @@ void DescribeRun::TellUnusedRows() const {
     const MovieColumns& table = *options_.form.columns;
     std::size_t unused = 0;
     for (const MovieColumns::Row& row : table.rows()) {
-        if (rowsUsed_.count(&row) == 0 && ++unused <= kMostTold) {
+        if (movieOfRow_.count(&row) == 0 && ++unused <= kMostTold) {
             Notice("cliphost: {}: row {}: no movie is {}\n", DisplayPath(table.file()), row.number,
                    row.movie);
         }

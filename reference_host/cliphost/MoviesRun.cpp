@@ -56,6 +56,7 @@ void MoviesRun::TellAlso(const Failure& failure) {
 
 void MoviesRun::Begin() {
     looks_.clear();
+    refused_.clear();
     placesOfRequests_.clear();
     nextPlace_ = 0;
     answers_.clear();
@@ -134,7 +135,7 @@ void MoviesRun::LookAtMovies() {
     looks_.resize(plan().size());
     for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
         const MovieStep step = plan()[i];
-        if (!step.IsMovie()) {
+        if (!step.IsMovie() || refused_.count(i) > 0) {
             continue;
         }
         Look& look = looks_[i];
@@ -341,6 +342,8 @@ void MoviesRun::TellInstead(std::size_t place) {
         }
         ShowDone(step.movie,
                  options_.outFolder / OutputName(step.movie, plan().NumberOf(place), ending_));
+    } else if (const auto refused = refused_.find(place); refused != refused_.end()) {
+        GoOnAfterFailure(step.movie, [&] { throw Failure(refused->second); });
     } else if (step.notice) {
         TellProblem(*step.notice, session_.verbosity());
     } else {

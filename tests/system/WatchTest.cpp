@@ -153,6 +153,23 @@ TEST_F(Watch, SeesNewFoldersAndKeepsNamesApart) {
     EXPECT_FALSE(std::filesystem::exists(Out("clip-3.aaf")));
 }
 
+TEST_F(Watch, TellsOfMoviesOfOneRowAndGoesOn) {
+    std::ofstream(folder() / "in.csv") << "name,Scene\nclip,1\nlast,2\n";
+    Copy("png.mov", In("a/clip.mov"));
+    Copy("mjpeg.mov", In("b/clip.mov"));
+    Begin("--recursive --columns " + Quoted(folder() / "in.csv"));
+    EXPECT_TRUE(Tells("row 2: clip may be ")) << Told();
+    Copy("png.mov", In("first.mov"));
+    Copy("png.mov", In("a/last.mov"));
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    EXPECT_TRUE(Makes("last.aaf")) << Told();
+    // The row is that of the movie which came first.
+    Copy("mjpeg.mov", In("b/last.mov"));
+    EXPECT_TRUE(Tells("row 3: last may be ")) << Told();
+    Stop();
+    EXPECT_TRUE(Tells("the watch ends by signal 15")) << Told();
+}
+
 TEST_F(Watch, LooksWithoutBeingTold) {
     Copy("png.mov", In("first.mov"));
     Begin("--poll 1 --extensions MOV,mp4");
