@@ -101,7 +101,9 @@ private:
     void Take(const FolderChange& change) {
         switch (change.what) {
             case FolderChange::What::File:
-                if (HasEnding(change.path.filename(), describe_.movies.endings)) {
+                if (IsFolderToLookAt(change.path)) {  // behind a link
+                    LookAtTree(change.path);
+                } else if (HasEnding(change.path.filename(), describe_.movies.endings)) {
                     arrivals_.See(change.path, Clock::now());
                 }
                 break;
@@ -120,6 +122,11 @@ private:
                 LookAtAll();
                 break;
         }
+    }
+
+    bool IsFolderToLookAt(const std::filesystem::path& path) const {
+        std::error_code ignored;
+        return describe_.movies.isRecursive && std::filesystem::is_directory(path, ignored);
     }
 
     void LookAtAll() {

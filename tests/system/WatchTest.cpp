@@ -153,6 +153,19 @@ TEST_F(Watch, SeesNewFoldersAndKeepsNamesApart) {
     EXPECT_FALSE(std::filesystem::exists(Out("clip-3.aaf")));
 }
 
+TEST_F(Watch, FollowsLinksToFolders) {
+    Copy("png.mov", folder() / "other/deep/first.mov");
+    Begin("--recursive");
+    Copy("mjpeg.mov", In("here.mov"));
+    EXPECT_TRUE(Makes("here.aaf")) << Told();
+    std::filesystem::create_directory_symlink(folder() / "other", In("link"));
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    Copy("mjpeg.mov", folder() / "other/deep/second.mov");
+    EXPECT_TRUE(Makes("second.aaf")) << Told();
+    Stop();
+    EXPECT_TRUE(Tells("3 described, 0 not, 0 done already")) << Told();
+}
+
 TEST_F(Watch, TellsOfMoviesOfOneRowAndGoesOn) {
     std::ofstream(folder() / "in.csv") << "name,Scene\nclip,1\nlast,2\n";
     Copy("png.mov", In("a/clip.mov"));
