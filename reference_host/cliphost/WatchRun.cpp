@@ -8,6 +8,8 @@
 #include <cerrno>
 #include <chrono>
 #include <cstdio>
+#include <map>
+#include <optional>
 #include <set>
 #include <system_error>
 
@@ -18,6 +20,7 @@
 #include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/DelayedSignals.h"
+#include "reference_host/system/FileNumber.h"
 #include "reference_host/system/FolderWatch.h"
 
 namespace cliphost {
@@ -93,7 +96,7 @@ private:
         const auto now = Clock::now();
         if (poll_ != 0 && now - looked_ >= std::chrono::seconds(poll_)) {
             LookAtAll();
-        } else if (!gone_.empty() && now - lookedForGone_ >= kLookForGone) {
+        } else if (now - lookedForGone_ >= kLookForGone) {
             LookForGone();
         }
     }
@@ -138,9 +141,15 @@ private:
 
     void LookForGone() {
         lookedForGone_ = Clock::now();
-        const std::set<std::filesystem::path> gone = gone_;
-        for (const std::filesystem::path& root : gone) {
-            LookAtRoot(root);
+        for (const std::filesystem::path& root : roots_) {
+            const bool isGone = gone_.count(root) > 0;
+            // Nothing is told of a folder above it that is moved.
+            if (!isGone && host::system::NumberOf(root) != numbers_[root]) {
+                TellGone(root, "it went away");
+                LookAtRoot(root);
+            } else if (isGone) {
+                LookAtRoot(root);
+            }
         }
     }
 
@@ -149,6 +158,7 @@ private:
             TellGone(root, problem.reason);
             return;
         }
+        numbers_[root] = host::system::NumberOf(root);
         if (gone_.erase(root) > 0) {
             Notice("cliphost: {}: is there again\n", DisplayPath(root));
         }
@@ -207,6 +217,7 @@ private:
     DescribeRun run_;
     host::system::FolderWatch system_;
     std::set<std::filesystem::path> gone_;      // roots
+    std::map<std::filesystem::path, std::optional<host::system::FileNumber>> numbers_;  // of roots
     std::set<std::filesystem::path> toldOnce_;  // folders that can't be listed
     Clock::time_point looked_;
     Clock::time_point lookedForGone_;

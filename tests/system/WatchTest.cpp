@@ -28,7 +28,7 @@ protected:
         }
     }
 
-    std::filesystem::path In() { return folder() / "in"; }
+    std::filesystem::path In() { return folder() / below_; }
     std::filesystem::path In(const std::string& name) { return In() / name; }
     std::filesystem::path Out(const std::string& name) { return folder() / "out" / name; }
     void Copy(const std::string& movie, const std::filesystem::path& to) {
@@ -77,6 +77,7 @@ protected:
         return Within(30s, [&] { return std::filesystem::exists(Out(name)); });
     }
 
+    std::string below_ = "in";
     pid_t process_ = 0;
 };
 
@@ -208,6 +209,19 @@ TEST_F(Watch, TellsOfFoldersThatGoAndComeBack) {
     EXPECT_TRUE(Makes("second.aaf")) << Told();
     Stop();
     EXPECT_TRUE(Tells("2 described, 0 not, 0 done already")) << Told();
+}
+
+TEST_F(Watch, TellsOfFoldersAboveThatGoAndComeBack) {
+    below_ = "above/below";
+    Begin();
+    Copy("png.mov", In("first.mov"));
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    std::filesystem::rename(folder() / "above", folder() / "away");
+    EXPECT_TRUE(Tells("below: is not watched: ")) << Told();
+    Copy("mjpeg.mov", In("second.mov"));
+    EXPECT_TRUE(Tells("below: is there again")) << Told();
+    EXPECT_TRUE(Makes("second.aaf")) << Told();
+    Stop();
 }
 
 // What happens while the system keeps no more is found by looking at all again.
