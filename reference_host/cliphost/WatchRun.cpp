@@ -183,8 +183,25 @@ private:
         }
     }
 
+    // A folder keeps its first path while that leads to it: by another one, such as through a link
+    // upwards, its movies would all arrive again.
+    bool IsKnownByOtherPath(const std::filesystem::path& folder) {
+        const auto number = host::system::NumberOf(folder);
+        if (!number) {
+            return false;
+        }
+        const auto [known, isNew] = pathOf_.emplace(*number, folder);
+        if (!isNew && known->second != folder && host::system::NumberOf(known->second) != number) {
+            known->second = folder;
+        }
+        return known->second != folder;
+    }
+
     // Watched first, so that nothing comes in between.
     void LookAtFolder(const std::filesystem::path& folder) {
+        if (IsKnownByOtherPath(folder)) {
+            return;
+        }
         if (poll_ == 0) {
             const int error = system_.Add(folder);
             std::error_code ignored;
@@ -218,6 +235,7 @@ private:
     host::system::FolderWatch system_;
     std::set<std::filesystem::path> gone_;      // roots
     std::map<std::filesystem::path, std::optional<host::system::FileNumber>> numbers_;  // of roots
+    std::map<host::system::FileNumber, std::filesystem::path> pathOf_;  // of folders
     std::set<std::filesystem::path> toldOnce_;  // folders that can't be listed
     Clock::time_point looked_;
     Clock::time_point lookedForGone_;

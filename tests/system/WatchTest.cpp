@@ -154,6 +154,22 @@ TEST_F(Watch, SeesNewFoldersAndKeepsNamesApart) {
     EXPECT_FALSE(std::filesystem::exists(Out("clip-3.aaf")));
 }
 
+// A link upwards leads to folders that are known.
+TEST_F(Watch, TakesNoMovieAgainByAnotherPath) {
+    Copy("png.mov", In("a/first.mov"));
+    Begin("--recursive");
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    Copy("mjpeg.mov", folder() / "b/second.mov");
+    std::filesystem::create_directory_symlink(In(), folder() / "b/up");
+    std::filesystem::rename(folder() / "b", In("b"));
+    EXPECT_TRUE(Makes("second.aaf")) << Told();
+    Copy("png.mov", In("a/third.mov"));
+    EXPECT_TRUE(Makes("third.aaf")) << Told();
+    Stop();
+    EXPECT_TRUE(Tells("3 described, 0 not, 0 done already")) << Told();
+    EXPECT_EQ(Told().find("b/up"), std::string::npos) << Told();
+}
+
 TEST_F(Watch, FollowsLinksToFolders) {
     Copy("png.mov", folder() / "other/deep/first.mov");
     Begin("--recursive");
