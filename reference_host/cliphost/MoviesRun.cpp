@@ -97,6 +97,11 @@ void MoviesRun::DoPlan(Held& held) {
     if (isForWorkers || plan().size() > 1) {
         held.signals.emplace(isForWorkers ? nullptr : kStopsSoon);
     }
+    std::error_code ignored;
+    if (options_.names != nullptr && !std::filesystem::is_directory(options_.outFolder, ignored)) {
+        // What it held, and what was recorded there, is lost: that is no new start.
+        throw Failure(kExitCaller, options_.outFolder, "the folder for outputs went away");
+    }
     if (!options_.outFolder.empty()) {
         held.folder.emplace(options_.outFolder);
     }

@@ -55,6 +55,13 @@ protected:
         process_ = 0;
         return WIFSIGNALED(status) ? WTERMSIG(status) : -1;
     }
+    // Of one that ends by itself.
+    int ExitStatus() {
+        int status = 0;
+        waitpid(process_, &status, 0);
+        process_ = 0;
+        return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+    }
     std::string Told() {
         std::ostringstream text;
         text << std::ifstream(folder() / "told").rdbuf();
@@ -181,6 +188,17 @@ TEST_F(Watch, FollowsLinksToFolders) {
     EXPECT_TRUE(Makes("second.aaf")) << Told();
     Stop();
     EXPECT_TRUE(Tells("3 described, 0 not, 0 done already")) << Told();
+}
+
+TEST_F(Watch, EndsWithoutTheFolderForOutputs) {
+    Begin();
+    Copy("png.mov", In("first.mov"));
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    std::filesystem::remove_all(folder() / "out");
+    Copy("png.mov", In("second.mov"));
+    EXPECT_TRUE(Tells("out: the folder for outputs went away")) << Told();
+    EXPECT_EQ(ExitStatus(), 2);
+    EXPECT_FALSE(std::filesystem::exists(folder() / "out"));
 }
 
 TEST_F(Watch, TellsOfMoviesOfOneRowAndGoesOn) {
