@@ -33,6 +33,21 @@ bool IsFlag(const CLI::Option& option) {
     return option.get_items_expected_max() == 0;
 }
 
+bool IsOff(const std::string& flag) {
+    try {
+        return CLI::detail::to_flag_value(flag) <= 0;
+    } catch (const std::invalid_argument&) {
+        return false;  // which the option refuses
+    }
+}
+
+// Whether the command line gives an option; a flag that it takes back is none.
+bool IsGiven(const CLI::Option& option) {
+    const auto& values = option.results();
+    return !values.empty() &&
+           !(IsFlag(option) && std::all_of(values.begin(), values.end(), IsOff));
+}
+
 // A setting with the option that it is for.
 struct Setting : FileSetting {
     CLI::Option* option = nullptr;
@@ -84,7 +99,14 @@ private:
                 settings.push_back(std::move(setting));
             }
         }
+        const auto isOff = [&](const Setting& setting) {
+            return IsFlag(*setting.option) && TimesOfFlag(file, setting) == 0;
+        };
+        settings.erase(std::remove_if(settings.begin(), settings.end(), isOff), settings.end());
         DropUnmet(settings);
+        for (const Setting& setting : settings) {
+            LetGoWhatIsOff(setting);
+        }
         for (const Setting& setting : settings) {
             Apply(file, setting, settings);
         }
@@ -138,7 +160,7 @@ private:
         const auto excluding = setting.option->get_excludes();
         return setting.option->count() == 0 &&
                std::none_of(excluding.begin(), excluding.end(),
-                            [](const CLI::Option* other) { return other->count() > 0; });
+                            [](const CLI::Option* other) { return IsGiven(*other); });
     }
 
     // An option may need one that needs another.
@@ -146,7 +168,7 @@ private:
         const auto isUnmet = [&](const Setting& setting) {
             const auto needs = setting.option->get_needs();
             return std::any_of(needs.begin(), needs.end(), [&](const CLI::Option* needed) {
-                return needed->count() == 0 && !IsThere(settings, needed);
+                return !IsGiven(*needed) && !IsThere(settings, needed);
             });
         };
         for (auto unmet = settings.begin(); unmet != settings.end();) {
@@ -169,7 +191,9 @@ private:
             }
         }
         if (IsFlag(*setting.option)) {
-            ApplyFlag(file, setting);
+            for (int times = TimesOfFlag(file, setting); times > 0; --times) {
+                setting.option->add_result("true");
+            }
             return;
         }
         try {
@@ -188,15 +212,22 @@ private:
     }
 
     // As often as the option would be given; -v counts.
-    static void ApplyFlag(const std::filesystem::path& file, const Setting& setting) {
+    static int TimesOfFlag(const std::filesystem::path& file, const Setting& setting) {
         const std::string& value = setting.values[0];
         const bool isCount = value.size() == 1 && value[0] >= '0' && value[0] <= '9';
         if (setting.values.size() != 1 || !(value == "true" || value == "false" || isCount)) {
             Refuse(file, setting.line,
                    fmt::format("{}: '{}' is neither true nor false", setting.Key(), value), "");
         }
-        for (int times = isCount ? value[0] - '0' : value == "true" ? 1 : 0; times > 0; --times) {
-            setting.option->add_result("true");
+        return isCount ? value[0] - '0' : value == "true" ? 1 : 0;
+    }
+
+    // The parser itself would see it as given beside what it excludes.
+    static void LetGoWhatIsOff(const Setting& setting) {
+        for (CLI::Option* const other : setting.option->get_excludes()) {
+            if (other->count() > 0 && !IsGiven(*other)) {
+                other->clear();
+            }
         }
     }
 

@@ -91,6 +91,24 @@ TEST_F(SettingsFile, CountsAndNegates) {
     ExpectSays(ran, 0, "MasterMob");
 }
 
+// A flag that is off excludes nothing, and nothing can need it.
+TEST_F(SettingsFile, TakesNoAccountOfFlagsThatAreOff) {
+    Settings("[describe]\njson = false\njsonl = true\n");
+    CommandResult ran = Describe("");
+    ASSERT_EQ(ran.status, 0) << ran.out;
+    EXPECT_TRUE(Json::parse(ran.out).is_object()) << ran.out;
+    Settings("[describe]\njsonl = true\n");
+    ran = Describe("--json=false");
+    ASSERT_EQ(ran.status, 0) << ran.out;
+    EXPECT_TRUE(Json::parse(ran.out).is_object()) << ran.out;
+    Settings("[describe]\njson = true\n");
+    EXPECT_NE(Describe("--json=false").out.find("MasterMob"), std::string::npos);
+    Settings("[describe]\nwatch = false\nrest = 2\njson = true\n");
+    ran = Describe("");
+    ASSERT_EQ(ran.status, 0) << ran.out;
+    EXPECT_TRUE(Json::parse(ran.out).is_array()) << ran.out;
+}
+
 TEST_F(SettingsFile, MayBeAnotherOneOrNone) {
     Settings("nonsense = 1\n");
     std::ofstream(folder() / "other.toml") << "[describe]\nquiet = true\n";
