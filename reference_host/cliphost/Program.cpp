@@ -137,7 +137,11 @@ int Run(int argc, char** argv) {
         for (int i = argc - 1; i > 0; --i) {  // the parser takes the last first
             arguments.push_back(MarkedText(argv[i]));
         }
-        app.parse(std::move(arguments));
+        try {
+            app.parse(std::move(arguments));
+        } catch (const CLI::FileError&) {
+            RefuseGivenSettings(app);
+        }
     } catch (const CLI::ParseError& error) {
         return app.exit(error) == 0 ? kExitFine : kExitCaller;
     } catch (const ReaderGone&) {

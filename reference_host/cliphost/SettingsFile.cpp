@@ -29,6 +29,16 @@ namespace {
                   "--no-config goes without them");
 }
 
+// Of a file that the parser could not read.
+int ReadErrorOf(const std::filesystem::path& file) {
+    std::error_code error;
+    const auto kind = std::filesystem::status(file, error).type();
+    return kind == std::filesystem::file_type::not_found   ? ENOENT
+           : error                                         ? error.value()
+           : kind == std::filesystem::file_type::directory ? EISDIR
+                                                           : EACCES;
+}
+
 bool IsFlag(const CLI::Option& option) {
     return option.get_items_expected_max() == 0;
 }
@@ -265,15 +275,16 @@ void RefuseUnreadSettings(CLI::App& app) {
         return;
     }
     const std::filesystem::path file = DefaultSettingsFile();
-    std::error_code error;
-    const auto kind = std::filesystem::status(file, error).type();
-    if (file.empty() || kind == std::filesystem::file_type::not_found) {
-        return;
+    if (const int reason = ReadErrorOf(file); !file.empty() && reason != ENOENT) {
+        FailToRead(file, reason);
     }
-    const int reason = error                                           ? error.value()
-                       : kind == std::filesystem::file_type::directory ? EISDIR
-                                                                       : EACCES;
-    FailToRead(file, reason);
+}
+
+void RefuseGivenSettings(const CLI::App& app) {
+    const std::filesystem::path file =
+        WithoutMarks(app.get_config_ptr()->results().empty() ? std::string()
+                                                             : app.get_config_ptr()->results()[0]);
+    FailToRead(file, ReadErrorOf(file));
 }
 
 }  // namespace cliphost

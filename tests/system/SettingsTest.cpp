@@ -117,8 +117,10 @@ TEST_F(SettingsFile, MayBeAnotherOneOrNone) {
     const CommandResult other = Describe("--config " + In("other.toml"));
     EXPECT_EQ(other.status, 0) << other.out;
     EXPECT_EQ(other.out.find("MasterMob"), std::string::npos);
-    ExpectSays(Describe("--config " + In("none.toml")), 2, "none.toml");
-    ExpectSays(Describe("--config " + Quoted(folder())), 2, folder().string());
+    ExpectSays(Describe("--config " + In("none.toml")), 2,
+               "none.toml: the settings can't be read: No such file or directory");
+    ExpectSays(Describe("--config " + Quoted(folder())), 2,
+               folder().string() + ": the settings can't be read: Is a directory");
 }
 
 // It may be a pipe, which can be read once.
