@@ -8,6 +8,7 @@
 #include <cerrno>
 #include <cstdlib>
 #include <fstream>
+#include <map>
 #include <sstream>
 #include <vector>
 
@@ -97,6 +98,7 @@ private:
 
     void Read(const std::filesystem::path& file, const std::string& content) const {
         Settings settings;
+        std::map<const CLI::Option*, std::string> seen;
         for (FileSetting& given : SettingsIn(file, content)) {
             CLI::App& verb = FindVerb(file, given);
             if (given.name.empty()) {
@@ -104,6 +106,12 @@ private:
             }
             Setting setting{std::move(given)};
             setting.option = &FindOption(file, verb, setting);
+            const auto [first, isNew] = seen.emplace(setting.option, setting.Key());
+            if (!isNew) {
+                Refuse(file, setting.line,
+                       fmt::format("{} and {} are one option", first->second, setting.Key()),
+                       "leave one out");
+            }
             if ((&verb == &app_ || verb.count() > 0) && !setting.values.empty() &&
                 IsForThisCall(setting)) {
                 settings.push_back(std::move(setting));
@@ -213,12 +221,19 @@ private:
             setting.option->run_callback();
         } catch (const CLI::Error& error) {
             Refuse(file, setting.line,
-                   fmt::format("{}: {}", setting.Key(), WithoutMarks(error.what())), "");
+                   fmt::format("{}: {}", setting.Key(), ReasonIn(error, *setting.option)), "");
         } catch (const Failure& failure) {
             Refuse(file, setting.line,
                    fmt::format("{}: {}", setting.Key(), failure.problem().reason),
                    failure.problem().hint);
         }
+    }
+
+    // The parser begins with the name of the option.
+    static std::string ReasonIn(const CLI::Error& error, const CLI::Option& option) {
+        const std::string text = WithoutMarks(error.what());
+        const std::string start = option.get_name() + ": ";
+        return text.rfind(start, 0) == 0 ? text.substr(start.size()) : text;
     }
 
     // As often as the option would be given; -v counts.
@@ -227,7 +242,9 @@ private:
         const bool isCount = value.size() == 1 && value[0] >= '0' && value[0] <= '9';
         if (setting.values.size() != 1 || !(value == "true" || value == "false" || isCount)) {
             Refuse(file, setting.line,
-                   fmt::format("{}: '{}' is neither true nor false", setting.Key(), value), "");
+                   fmt::format("{}: '{}' is neither true nor false, nor a number from 0 to 9",
+                               setting.Key(), value),
+                   "");
         }
         return isCount ? value[0] - '0' : value == "true" ? 1 : 0;
     }

@@ -91,6 +91,14 @@ TEST_F(SettingsFile, CountsAndNegates) {
     ExpectSays(ran, 0, "MasterMob");
 }
 
+TEST_F(SettingsFile, SaysWhatIsWrongInItsOwnWords) {
+    ExpectRefused("\n[describe]\njobs = \"many\"\n",
+                  "line 3: describe.jobs: 'many' is not a whole number");
+    ExpectRefused("[describe]\nq = true\nquiet = false\n",
+                  "line 3: describe.q and describe.quiet are one option");
+    ExpectRefused("v = 12\n", "line 1: v: '12' is neither true nor false, nor a number from 0 to 9");
+}
+
 // A flag that is off excludes nothing, and nothing can need it.
 TEST_F(SettingsFile, TakesNoAccountOfFlagsThatAreOff) {
     Settings("[describe]\njson = false\njsonl = true\n");
