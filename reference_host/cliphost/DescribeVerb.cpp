@@ -158,8 +158,10 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                 throw Failure(kExitCaller, "--bin", "standard output takes the JSON",
                               "name a file");
             }
-            if (options->form.json && host::system::IsStandardOutput(options->form.columnsOut)) {
-                throw Failure(kExitCaller, "--columns-out", "standard output takes the JSON",
+            if (host::system::IsStandardOutput(options->form.columnsOut)) {
+                throw Failure(kExitCaller, "--columns-out",
+                              options->form.json ? "standard output takes the JSON"
+                                                 : "standard output takes what is told of movies",
                               "name a file");
             }
             ReadColumns(options->form);

@@ -66,7 +66,9 @@ void OutputFile::Finish() {
 }
 
 void OutputFile::TryPlace() {
-    Check(stream_.Open(unfinished_->path()));
+    if (unfinished_) {
+        Check(stream_.Open(unfinished_->path()));
+    }
 }
 
 void OutputFile::Check(int error) {

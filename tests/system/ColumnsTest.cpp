@@ -237,7 +237,13 @@ TEST_F(Columns, NameWhatIsWrong) {
     ExpectSays(RunCliphost("describe " + movie + "--columns-out /nowhere/o.csv"), 2, "/nowhere");
     ExpectSays(RunCliphost("describe " + movie + "--columns-out " + In("png.mov")), 2,
                "this is the movie itself");
-    ExpectSays(RunCliphost("describe --json --columns-out - " + movie), 2, "standard output");
+    ExpectSays(RunCliphost("describe --json --columns-out - " + movie), 2,
+               "standard output takes the JSON");
+    ExpectSays(RunCliphost("describe --columns-out - " + movie), 2,
+               "--columns-out: standard output takes what is told of movies; name a file");
+    ran = RunCommand(Quoted(ProgramFolder() / "cliphost") + " describe --columns-out /dev/fd/3 " +
+                     movie + "3>&1 >" + In("told"));
+    ExpectSays(ran, 0, "path,name,reel");
     ExpectSays(RunCliphost("describe --skip-done --out-dir " + In("x") + " --columns-out " +
                            In("y") + " " + movie),
                2, "excludes");
