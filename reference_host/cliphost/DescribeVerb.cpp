@@ -172,6 +172,7 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));
             if (watch->isOn) {
+                status = kExitCaller;  // until a signal ends it
                 WatchFolders(running, *options, *watch);
                 status = kExitFine;
             } else {

@@ -17,7 +17,9 @@
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputFolder.h"
+#include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/FileNumber.h"
@@ -71,8 +73,7 @@ public:
         while (!DelayedSignals::HaveCome()) {
             describe_.movies.paths = arrivals_.Take(Clock::now());
             if (!describe_.movies.paths.empty()) {
-                run_.RunOnce();
-                std::fflush(stdout);
+                RunOnceAndPrint();
             } else {
                 WaitAndLook();
             }
@@ -83,6 +84,30 @@ public:
     }
 
 private:
+    // Who reads what is printed may go away, and nobody would know what comes.
+    void RunOnceAndPrint() {
+        int error = 0;
+        try {
+            run_.RunOnce();
+        } catch (const std::system_error& failed) {
+            if (std::ferror(stdout) == 0) {
+                throw;
+            }
+            error = failed.code().value();
+        }
+        if (error == 0 && std::fflush(stdout) != 0) {
+            error = errno;
+        } else if (error == 0 && std::ferror(stdout) != 0) {
+            error = EIO;
+        }
+        if (error != 0) {
+            TellProblem(NotWritten("standard output", error), 0);
+            Notice("cliphost: the watch ends: {} described, {} not, {} done already\n", run_.done(),
+                   run_.failed(), run_.doneBefore());
+            throw ReaderGone();
+        }
+    }
+
     void WaitAndLook() {
         auto time = kLongestRest;
         if (const auto next = arrivals_.Next()) {

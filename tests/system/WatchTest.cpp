@@ -201,6 +201,19 @@ TEST_F(Watch, EndsWithoutTheFolderForOutputs) {
     EXPECT_FALSE(std::filesystem::exists(folder() / "out"));
 }
 
+TEST_F(Watch, EndsWhenNobodyReadsWhatItPrints) {
+    Copy("png.mov", In("first.mov"));
+    for (const std::string form : {"-q", "--jsonl"}) {
+        const std::string told = Quoted(folder() / "told");
+        RunCommand("{ timeout 60 " + Quoted(ProgramFolder() / "cliphost") + " describe " + form +
+                   " --watch " + Quoted(In()) + " --rest 1 --out-dir " + Quoted(folder() / "out") +
+                   " 2>" + told + "; echo status $? >>" + told + "; } | true");
+        EXPECT_NE(Told().find("standard output: not written: Broken pipe"), std::string::npos)
+            << Told();
+        EXPECT_NE(Told().find("status 2"), std::string::npos) << Told();
+    }
+}
+
 TEST_F(Watch, TellsOfMoviesOfOneRowAndGoesOn) {
     std::ofstream(folder() / "in.csv") << "name,Scene\nclip,1\nlast,2\n";
     Copy("png.mov", In("a/clip.mov"));
