@@ -143,6 +143,9 @@ private:
             case FolderChange::What::Gone:
                 if (std::find(roots_.begin(), roots_.end(), change.path) != roots_.end()) {
                     TellGone(change.path, "it went away");
+                } else if (IsFolderToLookAt(change.path)) {
+                    // It was moved, is known by its new path, and lost its watch.
+                    LookAtTree(change.path);
                 }
                 break;
             case FolderChange::What::Missed:
@@ -162,6 +165,8 @@ private:
         for (const std::filesystem::path& root : roots_) {
             LookAtRoot(root);
         }
+        // Nobody tells of those that were removed when all is looked at.
+        arrivals_.LookForRemoved();
     }
 
     void LookForGone() {
