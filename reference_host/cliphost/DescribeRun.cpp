@@ -188,12 +188,14 @@ void DescribeRun::WriteColumns() const {
     };
     write(table.header());
     for (const auto& [movie, values] : columns_) {
-        write(table.Cells(MachinePath(std::filesystem::absolute(movie).lexically_normal()), values));
+        write(
+            table.Cells(MachinePath(std::filesystem::absolute(movie).lexically_normal()), values));
     }
     out.Finish();
     const auto tellLeftOut = [&](std::size_t count, const char* thing, const std::string& why) {
         if (count > 0) {
-            Notice("cliphost: {}: {} left out: {}\n", DisplayPath(file), Counted(count, thing), why);
+            Notice("cliphost: {}: {} left out: {}\n", DisplayPath(file), Counted(count, thing),
+                   why);
         }
     };
     tellLeftOut(table.columnsLeftOut(), "column",

@@ -92,7 +92,8 @@ void TakeFileUrls(CLI::App& app) {
 }
 
 std::string MarkedText(std::string argument) {
-    const std::size_t equals = argument.rfind("--", 0) == 0 ? argument.find('=') : std::string::npos;
+    const std::size_t equals =
+        argument.rfind("--", 0) == 0 ? argument.find('=') : std::string::npos;
     const std::size_t start = equals == std::string::npos ? 0 : equals + 1;
     if (start < argument.size() && argument[start] == '[' && argument.back() == ']') {
         argument.insert(start, 1, kMark);

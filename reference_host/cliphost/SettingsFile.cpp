@@ -55,8 +55,7 @@ bool IsOff(const std::string& flag) {
 // Whether the command line gives an option; a flag that it takes back is none.
 bool IsGiven(const CLI::Option& option) {
     const auto& values = option.results();
-    return !values.empty() &&
-           !(IsFlag(option) && std::all_of(values.begin(), values.end(), IsOff));
+    return !values.empty() && !(IsFlag(option) && std::all_of(values.begin(), values.end(), IsOff));
 }
 
 // A setting with the option that it is for.

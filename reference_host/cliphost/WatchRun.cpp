@@ -263,7 +263,7 @@ private:
     OutputFolder folder_;
     DescribeRun run_;
     host::system::FolderWatch system_;
-    std::set<std::filesystem::path> gone_;      // roots
+    std::set<std::filesystem::path> gone_;                                              // roots
     std::map<std::filesystem::path, std::optional<host::system::FileNumber>> numbers_;  // of roots
     std::map<host::system::FileNumber, std::filesystem::path> pathOf_;  // of folders
     std::set<std::filesystem::path> toldOnce_;  // folders that can't be listed

@@ -30,8 +30,8 @@ public:
 
 private:
     std::vector<std::string> header_;
-    std::map<std::string, std::size_t> places_;    // by the name in small letters
-    std::set<std::string> unplaced_;            // the same of those without a place
+    std::map<std::string, std::size_t> places_;  // by the name in small letters
+    std::set<std::string> unplaced_;             // the same of those without a place
     std::size_t tooLong_ = 0;
 };
 

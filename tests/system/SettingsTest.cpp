@@ -96,7 +96,8 @@ TEST_F(SettingsFile, SaysWhatIsWrongInItsOwnWords) {
                   "line 3: describe.jobs: 'many' is not a whole number");
     ExpectRefused("[describe]\nq = true\nquiet = false\n",
                   "line 3: describe.q and describe.quiet are one option");
-    ExpectRefused("v = 12\n", "line 1: v: '12' is neither true nor false, nor a number from 0 to 9");
+    ExpectRefused("v = 12\n",
+                  "line 1: v: '12' is neither true nor false, nor a number from 0 to 9");
 }
 
 // A flag that is off excludes nothing, and nothing can need it.
