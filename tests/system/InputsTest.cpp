@@ -196,15 +196,15 @@ TEST_F(Inputs, MayHaveNamesInBrackets) {
     expectSays("contact --output '[x,y]' '[2024]/a.mov'", 0, "");
     EXPECT_TRUE(std::filesystem::exists(folder() / "[x,y]"));
     expectSays("contact --out-dir sheets '[2024]' '[a,b]'", 0, "c.png");
-    expectSays("describe -q --bin '[b,c]' '[a,b]' --map='[a,b]=[M:]'", 2, "[a,b]=[M:]: ");
+    expectSays("describe -q --bin '[b,c]' '[a,b]' --map='[a,b]=[M:]'", 2, "--map [a,b]=[M:]: ");
     expectSays("describe -q --bin '[b,c]' '[a,b]'", 0, "c.mov");
     expectSays("verify '[b,c]'", 0, "1 clip: 1 same");
     expectSays("catalog '[2024]' '[a,b]' -o '[c,d]'", 0, "2");
-    expectSays("find '[c,d]' '[x,y]'", 0, "");
+    expectSays("find '[c,d]' '[x,y]'", 1, "");
     expectSays("describe '[no,ne]'", 2, "[no,ne]: there is no such file");
     expectSays("'[no,ne]'", 2, "'[no,ne]' is neither a verb nor an option");
-    std::ofstream(folder() / "[x,y].toml") << "[describe]\nmap = \"[x,y]\"\n";
-    expectSays("describe --config '[x,y].toml' '[a,b]'", 2, "[x,y]: ");
+    std::ofstream(folder() / "[x,y].toml") << "[describe]\nmap = \"[x,y]=[M:]\"\n";
+    expectSays("describe --config '[x,y].toml' '[a,b]'", 2, "describe.map: TO is no absolute path");
     std::ofstream(folder() / "[t,o]") << "[describe]\nquiet = true\n";
     expectSays("describe --config '[t,o]' '[a,b]'", 0, "c.mov");
 }

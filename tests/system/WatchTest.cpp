@@ -193,7 +193,7 @@ TEST_F(Watch, FollowsLinksToFolders) {
 TEST_F(Watch, EndsWithoutTheFolderForOutputs) {
     Begin();
     Copy("png.mov", In("first.mov"));
-    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    EXPECT_TRUE(Tells("first.aaf")) << Told();
     std::filesystem::remove_all(folder() / "out");
     Copy("png.mov", In("second.mov"));
     EXPECT_TRUE(Tells("out: the folder for outputs went away")) << Told();
