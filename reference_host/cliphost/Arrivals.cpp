@@ -3,6 +3,8 @@
 #include "reference_host/cliphost/Arrivals.h"
 
 #include <algorithm>
+#include <iterator>
+#include <system_error>
 
 namespace cliphost {
 
@@ -17,6 +19,16 @@ void Arrivals::See(const std::filesystem::path& file, Clock::time_point now) {
         if (!isNew && !(known->second.state == *state)) {
             known->second = {*state, now};
         }
+    }
+}
+
+void Arrivals::LookForRemoved() {
+    for (auto file = arrived_.begin(); file != arrived_.end();) {
+        const std::filesystem::path path(file->first);
+        std::error_code ignored;
+        const bool isRemoved =
+            !stateOf_(path) && std::filesystem::is_directory(path.parent_path(), ignored);
+        file = isRemoved ? arrived_.erase(file) : std::next(file);
     }
 }
 

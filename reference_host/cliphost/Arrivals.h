@@ -27,6 +27,9 @@ public:
 
     // Something may have happened to a file.
     void See(const std::filesystem::path& file, Clock::time_point now);
+    // The same of all that have arrived and are no longer in their folders; those of a folder that
+    // is away itself wait for it.
+    void LookForRemoved();
     // Those that have arrived since the last call, by the order of their paths.
     std::vector<std::filesystem::path> Take(Clock::time_point now);
     // When the next one may have; none is on its way: nothing.

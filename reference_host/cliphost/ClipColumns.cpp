@@ -151,7 +151,7 @@ ColumnValues ValuesOf(const std::vector<Comment>& comments) {
     ColumnValues values;
     for (const Comment& comment : comments) {
         const auto known = std::find_if(values.begin(), values.end(), [&](const auto& value) {
-            return value.first == comment.name;
+            return InSmallLetters(value.first) == InSmallLetters(comment.name);
         });
         if (known == values.end()) {
             values.emplace_back(comment.name, comment.text);
@@ -205,18 +205,22 @@ private:
         }
     }
 
-    // What is there already stays as it is. The names of comments are those of the module, or as
-    // the table writes them.
+    // What is there already stays as it is, its name too, which may differ in case from that of
+    // the table.
     void SetComment() {
-        const std::string& name = columns_.NameOf(*value_);
+        std::string name = columns_.NameOf(*value_);
+        const std::string small = InSmallLetters(name);
         const std::vector<Comment> comments = CommentsOf(*mobs_.master);
         for (const auto& [known, text] : ValuesOf(comments)) {
-            if (known == name && text == value_->text) {
-                return;
+            if (InSmallLetters(known) == small) {
+                if (text == value_->text) {
+                    return;
+                }
+                name = known;
             }
         }
         for (const Comment& comment : comments) {
-            if (comment.name == name) {
+            if (InSmallLetters(comment.name) == small) {
                 Check(mobs_.master->RemoveComment(comment.value.get()));
             }
         }
@@ -290,7 +294,10 @@ private:
             const auto clip = As<IAAFSourceClip>(segment);
             if (timecode && !hasTimecode) {
                 hasTimecode = true;
-                AddTimecode(*dictionary, *mob, *timecode, id, length, rate);
+                const aafTimecode_t counted =
+                    AddTimecode(*dictionary, *mob, *timecode, id, length, rate);
+                layout += fmt::format("\n{} {} {}", counted.startFrame, counted.fps,
+                                      counted.drop == kAAFTcDrop ? "drop" : "non-drop");
             } else if (clip) {
                 host::Ref<IAAFDataDef> data;
                 Check(slot.GetDataDef(data.Out()));
@@ -305,7 +312,7 @@ private:
             layout += fmt::format("\n{} {} {}/{} {}", id, length, rate.numerator, rate.denominator,
                                   DataOfSlot(slot).kind);
         });
-        // Movies of one reel with the same tracks lead to the same tape.
+        // Movies of one reel with the same tracks and count lead to the same tape.
         const aafMobID_t id = IdOf(*mob, layout);
         Check(mob->SetMobID(id));
         Check(header->AddMob(mob.get()));
@@ -314,8 +321,9 @@ private:
         }
     }
 
-    void AddTimecode(IAAFDictionary& dictionary, IAAFMob& mob, IAAFTimecode& like, aafSlotID_t id,
-                     aafLength_t length, const aafRational_t& rate) {
+    // Returns how it counts.
+    aafTimecode_t AddTimecode(IAAFDictionary& dictionary, IAAFMob& mob, IAAFTimecode& like,
+                              aafSlotID_t id, aafLength_t length, const aafRational_t& rate) {
         aafTimecode_t counted{};
         Check(like.GetTimecode(&counted));
         const auto timecode = New<IAAFTimecode>(dictionary, AUID_AAFTimecode);
@@ -324,6 +332,7 @@ private:
         Check(mob.AppendNewTimelineSlot(rate, As<IAAFSegment>(timecode.get()).get(), id, L"TC1", 0,
                                         timeline.Out()));
         Check(As<IAAFMobSlot>(timeline.get())->SetPhysicalNum(1));
+        return counted;
     }
 
     aafMobID_t IdOf(IAAFMob& mob, const std::string& layout) const {

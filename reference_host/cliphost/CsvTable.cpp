@@ -18,7 +18,6 @@ namespace cliphost {
 namespace {
 
 constexpr std::size_t kMostBytes = std::size_t{256} << 20;
-constexpr std::size_t kMostCells = 1000;
 
 [[noreturn]] void Refuse(const std::filesystem::path& file, std::uint64_t row,
                          const std::string& reason, const std::string& hint = {}) {

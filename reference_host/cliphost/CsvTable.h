@@ -22,6 +22,7 @@ struct CsvTable {
     std::vector<Row> rows;  // without empty ones
 };
 
+inline constexpr std::size_t kMostCells = 1000;      // of a row
 inline constexpr std::size_t kLongestCell = 10'000;  // bytes; an AAF file's texts are bounded
 
 // Reads a table in UTF-8, with a byte order mark or without. Throws a Failure that names `file` and

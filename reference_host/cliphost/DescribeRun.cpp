@@ -17,6 +17,7 @@
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/cliphost/WrittenTable.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -26,6 +27,7 @@ using host::DisplayPath;
 using nlohmann::ordered_json;
 
 constexpr std::size_t kRoomForEnds = 64;
+constexpr char kEndingOfOutputs[] = ".aaf";
 
 // An entry of a list in JSON. `description` is JSON already.
 std::string EntryText(const ordered_json& head, const std::string& description) {
@@ -49,10 +51,38 @@ std::string EntryText(const ordered_json& head, const std::string& description) 
     return text;
 }
 
+bool IsPlaceOf(const std::filesystem::path& output, const std::filesystem::path& file) {
+    std::error_code error;
+    const auto whole = [&](const std::filesystem::path& path) {
+        return std::filesystem::weakly_canonical(std::filesystem::absolute(path, error), error);
+    };
+    const std::filesystem::path place = whole(output);
+    return (!error && place == whole(file)) || std::filesystem::equivalent(output, file, error);
+}
+
+// What an output would take the place of, though the call needs both.
+struct CallFile {
+    const char* what;
+    std::filesystem::path file;
+};
+
+void RefuseOutputOnto(const std::filesystem::path& output, const std::vector<CallFile>& files) {
+    if (output.empty() || OutputFile::IsDevice(output)) {
+        return;
+    }
+    for (const CallFile& other : files) {
+        if (!other.file.empty() && !OutputFile::IsDevice(other.file) &&
+            IsPlaceOf(output, other.file)) {
+            throw Failure(kExitCaller, output, fmt::format("this is {}", other.what),
+                          "name another file");
+        }
+    }
+}
+
 }  // namespace
 
 DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
-    : MoviesRun(session, options.movies, "describing", ".aaf"),
+    : MoviesRun(session, options.movies, "describing", kEndingOfOutputs),
       options_(options),
       maps_(options.form.maps) {
     if (!options.movies.together.empty()) {
@@ -61,12 +91,32 @@ DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
     }
 }
 
+void DescribeRun::RefuseOutputsOntoOthers() const {
+    const MoviesOptions& movies = options_.movies;
+    const std::filesystem::path& table = options_.form.columnsOut;
+    const std::vector<CallFile> read = {{"the list of movies", movies.list},
+                                        {"the table of --columns", options_.form.columnsFile},
+                                        {"the settings file", options_.settingsFile}};
+    RefuseOutputOnto(movies.file, read);
+    RefuseOutputOnto(movies.together, read);
+    RefuseOutputOnto(table, read);
+    RefuseOutputOnto(table, {{"the file of --aaf", movies.file}, {"the bin", movies.together}});
+    // The names of the outputs are found one after the other.
+    if (!table.empty() && !movies.outFolder.empty() &&
+        InSmallLetters(table.extension().string()) == kEndingOfOutputs &&
+        IsPlaceOf(std::filesystem::absolute(table).parent_path(), movies.outFolder)) {
+        throw Failure(kExitCaller, table, "a movie's output may have this name",
+                      "give the table another ending or folder");
+    }
+}
+
 // Which rows are for which movies is known before anything is read.
 void DescribeRun::Planned(const MoviePlan& plan) {
+    RefuseOutputsOntoOthers();
     const std::shared_ptr<const MovieColumns>& table = options_.form.columns;
     const std::filesystem::path& written = options_.form.columnsOut;
     const bool mayBeMovie = !written.empty() && host::system::NumberOf(written).has_value();
-    std::map<const MovieColumns::Row*, std::string> movies;
+    std::map<const MovieColumns::Row*, std::size_t> places;
     for (std::size_t i = 0; i < plan.size() && (table || mayBeMovie); ++i) {
         const MovieStep step = plan[i];
         if (!step.IsMovie()) {
@@ -76,15 +126,30 @@ void DescribeRun::Planned(const MoviePlan& plan) {
             RefuseOutputOntoMovie(written, step.movie);
         }
         const MovieColumns::Row* const row = table ? table->Find(step.movie) : nullptr;
-        const auto [first, isNew] = movies.emplace(row, step.movie);
-        if (row != nullptr && !isNew && first->second != step.movie) {
-            throw Failure(kExitCaller, table->file(),
-                          fmt::format("row {}: {} may be {} or {}", row->number, row->movie,
-                                      DisplayPath(std::filesystem::path(first->second)),
-                                      DisplayPath(std::filesystem::path(step.movie))),
-                          "give its path");
+        if (row == nullptr) {
+            continue;
         }
-        rowsUsed_.insert(row);
+        const auto [place, isFirstNow] = places.emplace(row, i);
+        auto& movie = movieOfRow_.emplace(row, step.movie).first->second;
+        std::error_code ignored;
+        if (movie == step.movie) {
+            continue;
+        }
+        if (isFirstNow && !std::filesystem::exists(movie, ignored)) {
+            movie = step.movie;  // which was moved since
+            continue;
+        }
+        const Failure clash(kExitCaller, table->file(),
+                            fmt::format("row {}: {} may be {} or {}", row->number, row->movie,
+                                        DisplayPath(std::filesystem::path(movie)),
+                                        DisplayPath(std::filesystem::path(step.movie))),
+                            "give its path");
+        if (options_.movies.names == nullptr) {
+            throw clash;
+        }
+        // A row of movies that come one after the other may be clear for all others.
+        RefuseMovie(place->second, clash);
+        RefuseMovie(i, clash);
     }
     if (!written.empty()) {
         OutputFile(written).TryPlace();
@@ -96,7 +161,7 @@ void DescribeRun::TellUnusedRows() const {
     const MovieColumns& table = *options_.form.columns;
     std::size_t unused = 0;
     for (const MovieColumns::Row& row : table.rows()) {
-        if (rowsUsed_.count(&row) == 0 && ++unused <= kMostTold) {
+        if (movieOfRow_.count(&row) == 0 && ++unused <= kMostTold) {
             Notice("cliphost: {}: row {}: no movie is {}\n", DisplayPath(table.file()), row.number,
                    row.movie);
         }
@@ -107,39 +172,36 @@ void DescribeRun::TellUnusedRows() const {
     }
 }
 
-// The fixed columns, then those of the bin in the order in which they came.
 void DescribeRun::WriteColumns() const {
     const std::filesystem::path& file = options_.form.columnsOut;
     if (IsStopped()) {
         throw Failure(kExitFile, file, "not written: not all movies were read");
     }
-    std::vector<std::string> header(std::begin(kFixedColumns), std::end(kFixedColumns));
-    std::map<std::string, std::size_t> places;
-    for (const std::string& name : header) {
-        places.emplace(name, places.size());
-    }
+    WrittenTable table;
     for (const auto& [movie, values] : columns_) {
-        for (const auto& [name, value] : values) {
-            if (places.emplace(name, header.size()).second) {
-                header.push_back(name);
-            }
-        }
+        table.AddNames(values);
     }
     OutputFile out(file);
     const auto write = [&](const std::vector<std::string>& cells) {
         const std::string line = CsvLine(cells);
         out.Write(line.data(), line.size());
     };
-    write(header);
+    write(table.header());
     for (const auto& [movie, values] : columns_) {
-        std::vector<std::string> cells(header.size());
-        cells[0] = MachinePath(std::filesystem::absolute(movie).lexically_normal());
-        for (const auto& [name, value] : values) {
-            cells[places[name]] = value;
-        }
-        write(cells);
+        write(
+            table.Cells(MachinePath(std::filesystem::absolute(movie).lexically_normal()), values));
     }
     out.Finish();
+    const auto tellLeftOut = [&](std::size_t count, const char* thing, const std::string& why) {
+        if (count > 0) {
+            Notice("cliphost: {}: {} left out: {}\n", DisplayPath(file), Counted(count, thing),
+                   why);
+        }
+    };
+    tellLeftOut(table.columnsLeftOut(), "column",
+                fmt::format("a table has {} at most", kMostCells));
+    tellLeftOut(table.valuesLeftOut(), "value",
+                fmt::format("a cell has {} bytes at most", kLongestCell));
 }
 
 MovieAnswer DescribeRun::Answer(const MovieStep& step, const PlaceOfFile& place) {

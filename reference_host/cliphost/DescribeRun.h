@@ -2,9 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <map>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
-#include <set>
+#include <string>
 
 #include "reference_host/cliphost/Bin.h"
 #include "reference_host/cliphost/MoviesRun.h"
@@ -15,7 +16,8 @@ struct DescribeOptions {
     MoviesOptions movies;
     DescriptionForm form;
     bool stringout = false;
-    double editorRate = 25.0;  // frames per second
+    double editorRate = 25.0;            // frames per second
+    std::filesystem::path settingsFile;  // that was read; empty: none
 };
 
 // Describes all movies of the command line.
@@ -33,6 +35,7 @@ private:
     void Collect(const std::filesystem::path& movie, const std::filesystem::path& file) override;
     void Finish(int described, int failed) override;
     void Planned(const MoviePlan& plan) override;
+    void RefuseOutputsOntoOthers() const;
     void TellUnusedRows() const;
     void WriteColumns() const;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
@@ -44,7 +47,7 @@ private:
     PathMaps maps_;  // to know which were used
     std::optional<Bin> bin_;
     std::filesystem::path copyOf_;  // what the last movie that went into the bin is a copy of
-    std::set<const MovieColumns::Row*> rowsUsed_;
+    std::map<const MovieColumns::Row*, std::string> movieOfRow_;
     std::vector<std::pair<std::filesystem::path::string_type, ColumnValues>> columns_;
     std::vector<std::string> entries_;  // of the JSON list that comes at the end
 };

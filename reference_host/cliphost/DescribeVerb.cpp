@@ -158,15 +158,21 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                 throw Failure(kExitCaller, "--bin", "standard output takes the JSON",
                               "name a file");
             }
-            if (options->form.json && host::system::IsStandardOutput(options->form.columnsOut)) {
-                throw Failure(kExitCaller, "--columns-out", "standard output takes the JSON",
+            if (host::system::IsStandardOutput(options->form.columnsOut)) {
+                throw Failure(kExitCaller, "--columns-out",
+                              options->form.json ? "standard output takes the JSON"
+                                                 : "standard output takes what is told of movies",
                               "name a file");
             }
             ReadColumns(options->form);
             options->editorRate = session.host.editorFrameRate.value_or(options->editorRate);
+            if (app.get_config_ptr()->count() > 0) {
+                options->settingsFile = app.get_config_ptr()->as<std::string>();
+            }
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             Session running(WithTime(session, *pinned));
             if (watch->isOn) {
+                status = kExitCaller;  // until a signal ends it
                 WatchFolders(running, *options, *watch);
                 status = kExitFine;
             } else {

@@ -56,6 +56,7 @@ void MoviesRun::TellAlso(const Failure& failure) {
 
 void MoviesRun::Begin() {
     looks_.clear();
+    refused_.clear();
     placesOfRequests_.clear();
     nextPlace_ = 0;
     answers_.clear();
@@ -96,6 +97,11 @@ void MoviesRun::DoPlan(Held& held) {
     if (isForWorkers || plan().size() > 1) {
         held.signals.emplace(isForWorkers ? nullptr : kStopsSoon);
     }
+    std::error_code ignored;
+    if (options_.names != nullptr && !std::filesystem::is_directory(options_.outFolder, ignored)) {
+        // What it held, and what was recorded there, is lost: that is no new start.
+        throw Failure(kExitCaller, options_.outFolder, "the folder for outputs went away");
+    }
     if (!options_.outFolder.empty()) {
         held.folder.emplace(options_.outFolder);
     }
@@ -134,7 +140,7 @@ void MoviesRun::LookAtMovies() {
     looks_.resize(plan().size());
     for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
         const MovieStep step = plan()[i];
-        if (!step.IsMovie()) {
+        if (!step.IsMovie() || refused_.count(i) > 0) {
             continue;
         }
         Look& look = looks_[i];
@@ -341,6 +347,8 @@ void MoviesRun::TellInstead(std::size_t place) {
         }
         ShowDone(step.movie,
                  options_.outFolder / OutputName(step.movie, plan().NumberOf(place), ending_));
+    } else if (const auto refused = refused_.find(place); refused != refused_.end()) {
+        GoOnAfterFailure(step.movie, [&] { throw Failure(refused->second); });
     } else if (step.notice) {
         TellProblem(*step.notice, session_.verbosity());
     } else {

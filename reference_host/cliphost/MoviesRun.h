@@ -71,6 +71,8 @@ protected:
     std::optional<host::system::FileState> StateBefore() const {
         return looks_.empty() ? std::nullopt : looks_[shown_].state;
     }
+    // For Planned: a movie is not read, but fails so.
+    void RefuseMovie(std::size_t place, Failure why) { refused_.emplace(place, std::move(why)); }
     const MoviePlan& plan() const { return *plan_; }
     // For Finish: whether a signal stopped the run.
     bool IsStopped() const { return isStopped_; }
@@ -92,7 +94,9 @@ private:
     std::filesystem::path PlaceToWrite() const;
     bool IsDone(std::size_t place) const { return !looks_.empty() && looks_[place].isDone; }
     // Whether its movie is to be read.
-    bool IsToDo(std::size_t place) const { return !IsDone(place) && plan()[place].IsMovie(); }
+    bool IsToDo(std::size_t place) const {
+        return !IsDone(place) && refused_.count(place) == 0 && plan()[place].IsMovie();
+    }
     void TellInstead(std::size_t place);
     void TellThoseBefore(std::size_t place);
     bool Read(std::size_t number, const std::string& answer) override;
@@ -123,6 +127,7 @@ private:
         bool isDone = false;                           // its output is there
     };
     std::vector<Look> looks_;                      // where LooksFirst says so
+    std::map<std::size_t, Failure> refused_;       // by their places
     std::size_t shown_ = 0;                        // the place of the movie at hand
     std::vector<std::uint32_t> placesOfRequests_;  // among the steps
     std::size_t nextPlace_ = 0;

@@ -4,6 +4,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <filesystem>
 
 #include "reference_host/cliphost/Failure.h"
@@ -18,6 +19,8 @@ namespace {
 // has a higher one.
 constexpr double kSlowest = 0.01;
 constexpr double kFastest = 10000.0;
+
+constexpr char kMark = '\0';  // no argument holds it
 
 // Each option of the program and of its verbs that takes a value.
 template <class Action>
@@ -86,6 +89,31 @@ void TakeFileUrls(CLI::App& app) {
         },
         "", "FileUrl");
     ForEachValueOption(app, [&](CLI::Option& option) { option.transform(toPath); });
+}
+
+std::string MarkedText(std::string argument) {
+    const std::size_t equals =
+        argument.rfind("--", 0) == 0 ? argument.find('=') : std::string::npos;
+    const std::size_t start = equals == std::string::npos ? 0 : equals + 1;
+    if (start < argument.size() && argument[start] == '[' && argument.back() == ']') {
+        argument.insert(start, 1, kMark);
+    }
+    return argument;
+}
+
+void TakeMarkedTexts(CLI::App& app) {
+    const CLI::Validator unmark(
+        [](std::string& text) {
+            text = WithoutMarks(std::move(text));
+            return std::string();
+        },
+        "", "MarkedText");
+    ForEachValueOption(app, [&](CLI::Option& option) { option.transform(unmark); });
+}
+
+std::string WithoutMarks(std::string text) {
+    text.erase(std::remove(text.begin(), text.end(), kMark), text.end());
+    return text;
 }
 
 void RefuseOutputOntoMovie(const std::filesystem::path& output,

@@ -23,6 +23,13 @@ void RefuseEmptyTexts(CLI::App& app);
 // Every option that takes a text takes a file URL as the path that it names.
 void TakeFileUrls(CLI::App& app);
 
+// The parser takes an argument such as [a,b] for a list. These keep it a text: the first marks such
+// an argument, or such a value behind an option's name, and the second takes the mark away when the
+// option gets it; the third takes it out of what is told.
+std::string MarkedText(std::string argument);
+void TakeMarkedTexts(CLI::App& app);
+std::string WithoutMarks(std::string text);
+
 // Refuses an output that would be written over the movie that it is made from.
 // Throws a Failure.
 void RefuseOutputOntoMovie(const std::filesystem::path& output, const std::filesystem::path& movie);

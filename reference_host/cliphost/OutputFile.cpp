@@ -73,7 +73,9 @@ void OutputFile::FinishIfFree() {
 }
 
 void OutputFile::TryPlace() {
-    Check(stream_.Open(unfinished_->path()));
+    if (unfinished_) {
+        Check(stream_.Open(unfinished_->path()));
+    }
 }
 
 void OutputFile::Check(int error) {

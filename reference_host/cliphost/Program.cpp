@@ -59,7 +59,7 @@ std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
         text = fmt::format("'{}' is neither a verb nor an option", rest.front());
     }
     return fmt::format("cliphost: {}\nRun with --help for more information.\n",
-                       host::text::PrintableLines(text));
+                       host::text::PrintableLines(cliphost::WithoutMarks(text)));
 }
 
 // Each verb's help ends with it, or with the verb's own.
@@ -129,10 +129,19 @@ int Run(int argc, char** argv) {
 
     RefuseEmptyTexts(app);
     TakeFileUrls(app);
+    TakeMarkedTexts(app);  // before all others
     app.failure_message(CommandLineProblem);
 
     try {
-        app.parse(argc, argv);
+        std::vector<std::string> arguments;
+        for (int i = argc - 1; i > 0; --i) {  // the parser takes the last first
+            arguments.push_back(MarkedText(argv[i]));
+        }
+        try {
+            app.parse(std::move(arguments));
+        } catch (const CLI::FileError&) {
+            RefuseGivenSettings(app);
+        }
     } catch (const CLI::ParseError& error) {
         return app.exit(error) == 0 ? kExitFine : kExitCaller;
     } catch (const ReaderGone&) {

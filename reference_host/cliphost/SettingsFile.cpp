@@ -8,10 +8,12 @@
 #include <cerrno>
 #include <cstdlib>
 #include <fstream>
+#include <map>
 #include <sstream>
 #include <vector>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/SettingsText.h"
 
 namespace cliphost {
@@ -28,8 +30,32 @@ namespace {
                   "--no-config goes without them");
 }
 
+// Of a file that the parser could not read.
+int ReadErrorOf(const std::filesystem::path& file) {
+    std::error_code error;
+    const auto kind = std::filesystem::status(file, error).type();
+    return kind == std::filesystem::file_type::not_found   ? ENOENT
+           : error                                         ? error.value()
+           : kind == std::filesystem::file_type::directory ? EISDIR
+                                                           : EACCES;
+}
+
 bool IsFlag(const CLI::Option& option) {
     return option.get_items_expected_max() == 0;
+}
+
+bool IsOff(const std::string& flag) {
+    try {
+        return CLI::detail::to_flag_value(flag) <= 0;
+    } catch (const std::invalid_argument&) {
+        return false;  // which the option refuses
+    }
+}
+
+// Whether the command line gives an option; a flag that it takes back is none.
+bool IsGiven(const CLI::Option& option) {
+    const auto& values = option.results();
+    return !values.empty() && !(IsFlag(option) && std::all_of(values.begin(), values.end(), IsOff));
 }
 
 // A setting with the option that it is for.
@@ -71,6 +97,7 @@ private:
 
     void Read(const std::filesystem::path& file, const std::string& content) const {
         Settings settings;
+        std::map<const CLI::Option*, std::string> seen;
         for (FileSetting& given : SettingsIn(file, content)) {
             CLI::App& verb = FindVerb(file, given);
             if (given.name.empty()) {
@@ -78,12 +105,25 @@ private:
             }
             Setting setting{std::move(given)};
             setting.option = &FindOption(file, verb, setting);
+            const auto [first, isNew] = seen.emplace(setting.option, setting.Key());
+            if (!isNew) {
+                Refuse(file, setting.line,
+                       fmt::format("{} and {} are one option", first->second, setting.Key()),
+                       "leave one out");
+            }
             if ((&verb == &app_ || verb.count() > 0) && !setting.values.empty() &&
                 IsForThisCall(setting)) {
                 settings.push_back(std::move(setting));
             }
         }
+        const auto isOff = [&](const Setting& setting) {
+            return IsFlag(*setting.option) && TimesOfFlag(file, setting) == 0;
+        };
+        settings.erase(std::remove_if(settings.begin(), settings.end(), isOff), settings.end());
         DropUnmet(settings);
+        for (const Setting& setting : settings) {
+            LetGoWhatIsOff(setting);
+        }
         for (const Setting& setting : settings) {
             Apply(file, setting, settings);
         }
@@ -137,7 +177,7 @@ private:
         const auto excluding = setting.option->get_excludes();
         return setting.option->count() == 0 &&
                std::none_of(excluding.begin(), excluding.end(),
-                            [](const CLI::Option* other) { return other->count() > 0; });
+                            [](const CLI::Option* other) { return IsGiven(*other); });
     }
 
     // An option may need one that needs another.
@@ -145,7 +185,7 @@ private:
         const auto isUnmet = [&](const Setting& setting) {
             const auto needs = setting.option->get_needs();
             return std::any_of(needs.begin(), needs.end(), [&](const CLI::Option* needed) {
-                return needed->count() == 0 && !IsThere(settings, needed);
+                return !IsGiven(*needed) && !IsThere(settings, needed);
             });
         };
         for (auto unmet = settings.begin(); unmet != settings.end();) {
@@ -168,14 +208,19 @@ private:
             }
         }
         if (IsFlag(*setting.option)) {
-            ApplyFlag(file, setting);
+            for (int times = TimesOfFlag(file, setting); times > 0; --times) {
+                setting.option->add_result("true");
+            }
             return;
         }
         try {
-            setting.option->add_result(setting.values);
+            for (const std::string& value : setting.values) {
+                setting.option->add_result(MarkedText(value));
+            }
             setting.option->run_callback();
         } catch (const CLI::Error& error) {
-            Refuse(file, setting.line, fmt::format("{}: {}", setting.Key(), error.what()), "");
+            Refuse(file, setting.line,
+                   fmt::format("{}: {}", setting.Key(), ReasonIn(error, *setting.option)), "");
         } catch (const Failure& failure) {
             Refuse(file, setting.line,
                    fmt::format("{}: {}", setting.Key(), failure.problem().reason),
@@ -183,16 +228,32 @@ private:
         }
     }
 
+    // The parser begins with the name of the option.
+    static std::string ReasonIn(const CLI::Error& error, const CLI::Option& option) {
+        const std::string text = WithoutMarks(error.what());
+        const std::string start = option.get_name() + ": ";
+        return text.rfind(start, 0) == 0 ? text.substr(start.size()) : text;
+    }
+
     // As often as the option would be given; -v counts.
-    static void ApplyFlag(const std::filesystem::path& file, const Setting& setting) {
+    static int TimesOfFlag(const std::filesystem::path& file, const Setting& setting) {
         const std::string& value = setting.values[0];
         const bool isCount = value.size() == 1 && value[0] >= '0' && value[0] <= '9';
         if (setting.values.size() != 1 || !(value == "true" || value == "false" || isCount)) {
             Refuse(file, setting.line,
-                   fmt::format("{}: '{}' is neither true nor false", setting.Key(), value), "");
+                   fmt::format("{}: '{}' is neither true nor false, nor a number from 0 to 9",
+                               setting.Key(), value),
+                   "");
         }
-        for (int times = isCount ? value[0] - '0' : value == "true" ? 1 : 0; times > 0; --times) {
-            setting.option->add_result("true");
+        return isCount ? value[0] - '0' : value == "true" ? 1 : 0;
+    }
+
+    // The parser itself would see it as given beside what it excludes.
+    static void LetGoWhatIsOff(const Setting& setting) {
+        for (CLI::Option* const other : setting.option->get_excludes()) {
+            if (other->count() > 0 && !IsGiven(*other)) {
+                other->clear();
+            }
         }
     }
 
@@ -230,15 +291,16 @@ void RefuseUnreadSettings(CLI::App& app) {
         return;
     }
     const std::filesystem::path file = DefaultSettingsFile();
-    std::error_code error;
-    const auto kind = std::filesystem::status(file, error).type();
-    if (file.empty() || kind == std::filesystem::file_type::not_found) {
-        return;
+    if (const int reason = ReadErrorOf(file); !file.empty() && reason != ENOENT) {
+        FailToRead(file, reason);
     }
-    const int reason = error                                           ? error.value()
-                       : kind == std::filesystem::file_type::directory ? EISDIR
-                                                                       : EACCES;
-    FailToRead(file, reason);
+}
+
+void RefuseGivenSettings(const CLI::App& app) {
+    const std::filesystem::path file =
+        WithoutMarks(app.get_config_ptr()->results().empty() ? std::string()
+                                                             : app.get_config_ptr()->results()[0]);
+    FailToRead(file, ReadErrorOf(file));
 }
 
 }  // namespace cliphost

@@ -26,6 +26,9 @@ void AddSettingsFile(CLI::App& app);
 // afterwards.
 void RefuseUnreadSettings(CLI::App& app);
 
+// Throws a Failure that says why the file of --config, which the parser refused, can't be read.
+[[noreturn]] void RefuseGivenSettings(const CLI::App& app);
+
 inline constexpr char kNoSettingsFile[] = "--no-config";
 
 }  // namespace cliphost

@@ -8,6 +8,8 @@
 #include <cerrno>
 #include <chrono>
 #include <cstdio>
+#include <map>
+#include <optional>
 #include <set>
 #include <system_error>
 
@@ -15,9 +17,12 @@
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputFolder.h"
+#include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/DelayedSignals.h"
+#include "reference_host/system/FileNumber.h"
 #include "reference_host/system/FolderWatch.h"
 
 namespace cliphost {
@@ -68,8 +73,7 @@ public:
         while (!DelayedSignals::HaveCome()) {
             describe_.movies.paths = arrivals_.Take(Clock::now());
             if (!describe_.movies.paths.empty()) {
-                run_.RunOnce();
-                std::fflush(stdout);
+                RunOnceAndPrint();
             } else {
                 WaitAndLook();
             }
@@ -80,6 +84,30 @@ public:
     }
 
 private:
+    // Who reads what is printed may go away, and nobody would know what comes.
+    void RunOnceAndPrint() {
+        int error = 0;
+        try {
+            run_.RunOnce();
+        } catch (const std::system_error& failed) {
+            if (std::ferror(stdout) == 0) {
+                throw;
+            }
+            error = failed.code().value();
+        }
+        if (error == 0 && std::fflush(stdout) != 0) {
+            error = errno;
+        } else if (error == 0 && std::ferror(stdout) != 0) {
+            error = EIO;
+        }
+        if (error != 0) {
+            TellProblem(NotWritten("standard output", error), 0);
+            Notice("cliphost: the watch ends: {} described, {} not, {} done already\n", run_.done(),
+                   run_.failed(), run_.doneBefore());
+            throw ReaderGone();
+        }
+    }
+
     void WaitAndLook() {
         auto time = kLongestRest;
         if (const auto next = arrivals_.Next()) {
@@ -93,7 +121,7 @@ private:
         const auto now = Clock::now();
         if (poll_ != 0 && now - looked_ >= std::chrono::seconds(poll_)) {
             LookAtAll();
-        } else if (!gone_.empty() && now - lookedForGone_ >= kLookForGone) {
+        } else if (now - lookedForGone_ >= kLookForGone) {
             LookForGone();
         }
     }
@@ -101,7 +129,9 @@ private:
     void Take(const FolderChange& change) {
         switch (change.what) {
             case FolderChange::What::File:
-                if (HasEnding(change.path.filename(), describe_.movies.endings)) {
+                if (IsFolderToLookAt(change.path)) {  // behind a link
+                    LookAtTree(change.path);
+                } else if (HasEnding(change.path.filename(), describe_.movies.endings)) {
                     arrivals_.See(change.path, Clock::now());
                 }
                 break;
@@ -113,6 +143,9 @@ private:
             case FolderChange::What::Gone:
                 if (std::find(roots_.begin(), roots_.end(), change.path) != roots_.end()) {
                     TellGone(change.path, "it went away");
+                } else if (IsFolderToLookAt(change.path)) {
+                    // It was moved, is known by its new path, and lost its watch.
+                    LookAtTree(change.path);
                 }
                 break;
             case FolderChange::What::Missed:
@@ -122,18 +155,31 @@ private:
         }
     }
 
+    bool IsFolderToLookAt(const std::filesystem::path& path) const {
+        std::error_code ignored;
+        return describe_.movies.isRecursive && std::filesystem::is_directory(path, ignored);
+    }
+
     void LookAtAll() {
         looked_ = Clock::now();
         for (const std::filesystem::path& root : roots_) {
             LookAtRoot(root);
         }
+        // Nobody tells of those that were removed when all is looked at.
+        arrivals_.LookForRemoved();
     }
 
     void LookForGone() {
         lookedForGone_ = Clock::now();
-        const std::set<std::filesystem::path> gone = gone_;
-        for (const std::filesystem::path& root : gone) {
-            LookAtRoot(root);
+        for (const std::filesystem::path& root : roots_) {
+            const bool isGone = gone_.count(root) > 0;
+            // Nothing is told of a folder above it that is moved.
+            if (!isGone && host::system::NumberOf(root) != numbers_[root]) {
+                TellGone(root, "it went away");
+                LookAtRoot(root);
+            } else if (isGone) {
+                LookAtRoot(root);
+            }
         }
     }
 
@@ -142,6 +188,7 @@ private:
             TellGone(root, problem.reason);
             return;
         }
+        numbers_[root] = host::system::NumberOf(root);
         if (gone_.erase(root) > 0) {
             Notice("cliphost: {}: is there again\n", DisplayPath(root));
         }
@@ -166,8 +213,25 @@ private:
         }
     }
 
+    // A folder keeps its first path while that leads to it: by another one, such as through a link
+    // upwards, its movies would all arrive again.
+    bool IsKnownByOtherPath(const std::filesystem::path& folder) {
+        const auto number = host::system::NumberOf(folder);
+        if (!number) {
+            return false;
+        }
+        const auto [known, isNew] = pathOf_.emplace(*number, folder);
+        if (!isNew && known->second != folder && host::system::NumberOf(known->second) != number) {
+            known->second = folder;
+        }
+        return known->second != folder;
+    }
+
     // Watched first, so that nothing comes in between.
     void LookAtFolder(const std::filesystem::path& folder) {
+        if (IsKnownByOtherPath(folder)) {
+            return;
+        }
         if (poll_ == 0) {
             const int error = system_.Add(folder);
             std::error_code ignored;
@@ -199,7 +263,9 @@ private:
     OutputFolder folder_;
     DescribeRun run_;
     host::system::FolderWatch system_;
-    std::set<std::filesystem::path> gone_;      // roots
+    std::set<std::filesystem::path> gone_;                                              // roots
+    std::map<std::filesystem::path, std::optional<host::system::FileNumber>> numbers_;  // of roots
+    std::map<host::system::FileNumber, std::filesystem::path> pathOf_;  // of folders
     std::set<std::filesystem::path> toldOnce_;  // folders that can't be listed
     Clock::time_point looked_;
     Clock::time_point lookedForGone_;

@@ -5,6 +5,7 @@
 
 #include <fstream>
 #include <map>
+#include <set>
 #include <sstream>
 
 #include "reference_host/cliphost/CsvTable.h"
@@ -88,6 +89,26 @@ TEST_F(Columns, MakeOneTapeForMoviesOfAReel) {
     EXPECT_EQ(dump.find("SourceID = nil"), dump.rfind("SourceID = nil"));
 }
 
+// One tape can't count both with drops and without.
+TEST_F(Columns, MakeATapeForEachCountOfAReel) {
+    const std::string movies =
+        Copy("timecode_2997_drop.mov", "d.mov") + Copy("timecode_2997_nondrop.mov", "n.mov");
+    ASSERT_EQ(RunCliphost("describe -q --bin " + In("b.aaf") + " " + movies +
+                          Table("name,reel\nd,R1\nn,R1\n"))
+                  .status,
+              0);
+    const std::string dump = Dump("b.aaf");
+    std::set<std::string> drops;
+    int tapes = 0;
+    for (std::size_t at = 0; (at = dump.find("TapeDescriptor", at)) != std::string::npos; ++tapes) {
+        at = dump.find("Drop = ", at);
+        ASSERT_NE(at, std::string::npos) << dump;
+        drops.insert(dump.substr(at, dump.find('\n', at) - at));
+    }
+    EXPECT_EQ(tapes, 2) << dump;
+    EXPECT_EQ(drops.size(), 2u) << dump;
+}
+
 TEST_F(Columns, CountDroppedFrames) {
     const std::string movie = Copy("timecode_2997_nondrop.mov", "n.mov");
     ASSERT_EQ(RunCliphost("describe -q " + movie + Table("name,start\nn,01:00:00;02\n") + "--aaf " +
@@ -134,6 +155,18 @@ TEST_F(Columns, ComeBackAsTheyWereWritten) {
     for (const char* const name : {"t.aaf", "p.aaf", "s.aaf", "m.aaf"}) {
         EXPECT_EQ(Text(std::string("one/") + name), Text(std::string("two/") + name)) << name;
     }
+}
+
+TEST_F(Columns, KeepTheNamesThatAreThere) {
+    const std::string movie = Copy("png.mov", "png.mov");
+    ASSERT_EQ(RunCliphost("describe -q " + movie + Table("name,VIDEO\npng,mine\n") + "--aaf " +
+                          In("a.aaf") + " --columns-out " + In("out.csv"))
+                  .status,
+              0);
+    const std::string dump = Dump("a.aaf");
+    EXPECT_TRUE(Holds(dump, "Name = \"Video\"\n      Value = \"mine\"")) << dump;
+    EXPECT_FALSE(Holds(dump, "VIDEO")) << dump;
+    ExpectSays(RunCliphost("describe -q " + movie + "--columns " + In("out.csv")), 0, "png.mov");
 }
 
 // Written back as it came, a table changes nothing.
@@ -204,10 +237,48 @@ TEST_F(Columns, NameWhatIsWrong) {
     ExpectSays(RunCliphost("describe " + movie + "--columns-out /nowhere/o.csv"), 2, "/nowhere");
     ExpectSays(RunCliphost("describe " + movie + "--columns-out " + In("png.mov")), 2,
                "this is the movie itself");
-    ExpectSays(RunCliphost("describe --json --columns-out - " + movie), 2, "standard output");
+    ExpectSays(RunCliphost("describe --json --columns-out - " + movie), 2,
+               "standard output takes the JSON");
+    ExpectSays(RunCliphost("describe --columns-out - " + movie), 2,
+               "--columns-out: standard output takes what is told of movies; name a file");
+    ran = RunCommand(Quoted(ProgramFolder() / "cliphost") + " describe --columns-out /dev/fd/3 " +
+                     movie + "3>&1 >" + In("told"));
+    ExpectSays(ran, 0, "path,name,reel");
     ExpectSays(RunCliphost("describe --skip-done --out-dir " + In("x") + " --columns-out " +
                            In("y") + " " + movie),
                2, "excludes");
+}
+
+TEST_F(Columns, TakeTheirPlaceFromNoOtherFile) {
+    const std::string movie = "describe -q " + Copy("png.mov", "png.mov");
+    const std::string table = Table("name,Scene\npng,1\n");
+    std::ofstream(folder() / "list") << (folder() / "png.mov").string() << "\n";
+    std::ofstream(folder() / "own.toml") << "v = 0\n";
+    std::filesystem::create_symlink("in.csv", folder() / "link.csv");
+    std::filesystem::create_directory(folder() / "out");
+    const auto expectKept = [&](const std::string& call, const std::string& words) {
+        const std::string before = Text("in.csv") + Text("list") + Text("own.toml");
+        ExpectSays(RunCliphost(call), 2, words);
+        EXPECT_EQ(Text("in.csv") + Text("list") + Text("own.toml"), before) << call;
+    };
+    const std::string to = "--columns-out ";
+    const std::string onto = folder().string() + "/./in.csv";
+    expectKept(movie + table + to + Quoted(onto), "this is the table of --columns");
+    expectKept(movie + table + to + In("link.csv"), "this is the table of --columns");
+    expectKept(movie + table + "--bin " + In("in.csv"), "this is the table of --columns");
+    expectKept(movie + table + "--aaf " + In("in.csv"), "this is the table of --columns");
+    const std::string list = "describe -q --files-from " + In("list") + " ";
+    expectKept(list + to + In("list"), "this is the list of movies");
+    expectKept(list + "--bin " + In("list"), "this is the list of movies");
+    const std::string own = "--config " + In("own.toml") + " ";
+    expectKept(movie + own + to + In("own.toml"), "this is the settings file");
+    expectKept(movie + "--aaf " + In("x") + " " + to + In("x"), "this is the file of --aaf");
+    expectKept(movie + "--bin " + In("x") + " " + to + In("out/../x"), "this is the bin");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "x"));
+    expectKept(movie + "--out-dir " + In("out") + " " + to + In("out/png.AAF"),
+               "a movie's output may have this name");
+    ExpectSays(RunCliphost(movie + "--out-dir " + In("out") + " " + to + In("out/png.csv")), 0,
+               "png.aaf");
 }
 
 // Another table makes other outputs.

@@ -184,6 +184,31 @@ TEST_F(Inputs, RefuseCallsThatMeanNothing) {
     }
 }
 
+// For the parser of the command line they would be lists.
+TEST_F(Inputs, MayHaveNamesInBrackets) {
+    Copy("[2024]/a.mov");
+    Copy("[a,b]/c.mov");
+    EXPECT_EQ(MoviesOf("'[2024]' '[a,b]'"), (Movies{"[2024]/a.mov", "[a,b]/c.mov"}));
+    const auto expectSays = [&](const std::string& call, int status, const std::string& words) {
+        const CommandResult ran = Run(call);
+        ExpectSays({ran.status, ran.out + Told()}, status, words);
+    };
+    expectSays("contact --output '[x,y]' '[2024]/a.mov'", 0, "");
+    EXPECT_TRUE(std::filesystem::exists(folder() / "[x,y]"));
+    expectSays("contact --out-dir sheets '[2024]' '[a,b]'", 0, "c.png");
+    expectSays("describe -q --bin '[b,c]' '[a,b]' --map='[a,b]=[M:]'", 2, "--map [a,b]=[M:]: ");
+    expectSays("describe -q --bin '[b,c]' '[a,b]'", 0, "c.mov");
+    expectSays("verify '[b,c]'", 0, "1 clip: 1 same");
+    expectSays("catalog '[2024]' '[a,b]' -o '[c,d]'", 0, "2");
+    expectSays("find '[c,d]' '[x,y]'", 1, "");
+    expectSays("describe '[no,ne]'", 2, "[no,ne]: there is no such file");
+    expectSays("'[no,ne]'", 2, "'[no,ne]' is neither a verb nor an option");
+    std::ofstream(folder() / "[x,y].toml") << "[describe]\nmap = \"[x,y]=[M:]\"\n";
+    expectSays("describe --config '[x,y].toml' '[a,b]'", 2, "describe.map: TO is no absolute path");
+    std::ofstream(folder() / "[t,o]") << "[describe]\nquiet = true\n";
+    expectSays("describe --config '[t,o]' '[a,b]'", 0, "c.mov");
+}
+
 TEST_F(Inputs, ComeFromFoldersWithinFolders) {
     Copy("in/b/z.mov");
     Copy("in/b/a/y.mov");

@@ -91,6 +91,33 @@ TEST_F(SettingsFile, CountsAndNegates) {
     ExpectSays(ran, 0, "MasterMob");
 }
 
+TEST_F(SettingsFile, SaysWhatIsWrongInItsOwnWords) {
+    ExpectRefused("\n[describe]\njobs = \"many\"\n",
+                  "line 3: describe.jobs: 'many' is not a whole number");
+    ExpectRefused("[describe]\nq = true\nquiet = false\n",
+                  "line 3: describe.q and describe.quiet are one option");
+    ExpectRefused("v = 12\n",
+                  "line 1: v: '12' is neither true nor false, nor a number from 0 to 9");
+}
+
+// A flag that is off excludes nothing, and nothing can need it.
+TEST_F(SettingsFile, TakesNoAccountOfFlagsThatAreOff) {
+    Settings("[describe]\njson = false\njsonl = true\n");
+    CommandResult ran = Describe("");
+    ASSERT_EQ(ran.status, 0) << ran.out;
+    EXPECT_TRUE(Json::parse(ran.out).is_object()) << ran.out;
+    Settings("[describe]\njsonl = true\n");
+    ran = Describe("--json=false");
+    ASSERT_EQ(ran.status, 0) << ran.out;
+    EXPECT_TRUE(Json::parse(ran.out).is_object()) << ran.out;
+    Settings("[describe]\njson = true\n");
+    EXPECT_NE(Describe("--json=false").out.find("MasterMob"), std::string::npos);
+    Settings("[describe]\nwatch = false\nrest = 2\njson = true\n");
+    ran = Describe("");
+    ASSERT_EQ(ran.status, 0) << ran.out;
+    EXPECT_TRUE(Json::parse(ran.out).is_array()) << ran.out;
+}
+
 TEST_F(SettingsFile, MayBeAnotherOneOrNone) {
     Settings("nonsense = 1\n");
     std::ofstream(folder() / "other.toml") << "[describe]\nquiet = true\n";
@@ -99,8 +126,10 @@ TEST_F(SettingsFile, MayBeAnotherOneOrNone) {
     const CommandResult other = Describe("--config " + In("other.toml"));
     EXPECT_EQ(other.status, 0) << other.out;
     EXPECT_EQ(other.out.find("MasterMob"), std::string::npos);
-    ExpectSays(Describe("--config " + In("none.toml")), 2, "none.toml");
-    ExpectSays(Describe("--config " + Quoted(folder())), 2, folder().string());
+    ExpectSays(Describe("--config " + In("none.toml")), 2,
+               "none.toml: the settings can't be read: No such file or directory");
+    ExpectSays(Describe("--config " + Quoted(folder())), 2,
+               folder().string() + ": the settings can't be read: Is a directory");
 }
 
 // It may be a pipe, which can be read once.

@@ -28,7 +28,7 @@ protected:
         }
     }
 
-    std::filesystem::path In() { return folder() / "in"; }
+    std::filesystem::path In() { return folder() / below_; }
     std::filesystem::path In(const std::string& name) { return In() / name; }
     std::filesystem::path Out(const std::string& name) { return folder() / "out" / name; }
     void Copy(const std::string& movie, const std::filesystem::path& to) {
@@ -55,6 +55,13 @@ protected:
         process_ = 0;
         return WIFSIGNALED(status) ? WTERMSIG(status) : -1;
     }
+    // Of one that ends by itself.
+    int ExitStatus() {
+        int status = 0;
+        waitpid(process_, &status, 0);
+        process_ = 0;
+        return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+    }
     std::string Told() {
         std::ostringstream text;
         text << std::ifstream(folder() / "told").rdbuf();
@@ -77,6 +84,7 @@ protected:
         return Within(30s, [&] { return std::filesystem::exists(Out(name)); });
     }
 
+    std::string below_ = "in";
     pid_t process_ = 0;
 };
 
@@ -153,6 +161,76 @@ TEST_F(Watch, SeesNewFoldersAndKeepsNamesApart) {
     EXPECT_FALSE(std::filesystem::exists(Out("clip-3.aaf")));
 }
 
+// A link upwards leads to folders that are known.
+TEST_F(Watch, TakesNoMovieAgainByAnotherPath) {
+    Copy("png.mov", In("a/first.mov"));
+    Begin("--recursive");
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    Copy("mjpeg.mov", folder() / "b/second.mov");
+    std::filesystem::create_directory_symlink(In(), folder() / "b/up");
+    std::filesystem::rename(folder() / "b", In("b"));
+    EXPECT_TRUE(Makes("second.aaf")) << Told();
+    Copy("png.mov", In("a/third.mov"));
+    EXPECT_TRUE(Makes("third.aaf")) << Told();
+    Stop();
+    EXPECT_TRUE(Tells("3 described, 0 not, 0 done already")) << Told();
+    EXPECT_EQ(Told().find("b/up"), std::string::npos) << Told();
+}
+
+TEST_F(Watch, FollowsLinksToFolders) {
+    Copy("png.mov", folder() / "other/deep/first.mov");
+    Begin("--recursive");
+    Copy("mjpeg.mov", In("here.mov"));
+    EXPECT_TRUE(Makes("here.aaf")) << Told();
+    std::filesystem::create_directory_symlink(folder() / "other", In("link"));
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    Copy("mjpeg.mov", folder() / "other/deep/second.mov");
+    EXPECT_TRUE(Makes("second.aaf")) << Told();
+    Stop();
+    EXPECT_TRUE(Tells("3 described, 0 not, 0 done already")) << Told();
+}
+
+TEST_F(Watch, EndsWithoutTheFolderForOutputs) {
+    Begin();
+    Copy("png.mov", In("first.mov"));
+    EXPECT_TRUE(Tells("first.aaf")) << Told();
+    std::filesystem::remove_all(folder() / "out");
+    Copy("png.mov", In("second.mov"));
+    EXPECT_TRUE(Tells("out: the folder for outputs went away")) << Told();
+    EXPECT_EQ(ExitStatus(), 2);
+    EXPECT_FALSE(std::filesystem::exists(folder() / "out"));
+}
+
+TEST_F(Watch, EndsWhenNobodyReadsWhatItPrints) {
+    Copy("png.mov", In("first.mov"));
+    for (const std::string form : {"-q", "--jsonl"}) {
+        const std::string told = Quoted(folder() / "told");
+        RunCommand("{ timeout 60 " + Quoted(ProgramFolder() / "cliphost") + " describe " + form +
+                   " --watch " + Quoted(In()) + " --rest 1 --out-dir " + Quoted(folder() / "out") +
+                   " 2>" + told + "; echo status $? >>" + told + "; } | true");
+        EXPECT_NE(Told().find("standard output: not written: Broken pipe"), std::string::npos)
+            << Told();
+        EXPECT_NE(Told().find("status 2"), std::string::npos) << Told();
+    }
+}
+
+TEST_F(Watch, TellsOfMoviesOfOneRowAndGoesOn) {
+    std::ofstream(folder() / "in.csv") << "name,Scene\nclip,1\nlast,2\n";
+    Copy("png.mov", In("a/clip.mov"));
+    Copy("mjpeg.mov", In("b/clip.mov"));
+    Begin("--recursive --columns " + Quoted(folder() / "in.csv"));
+    EXPECT_TRUE(Tells("row 2: clip may be ")) << Told();
+    Copy("png.mov", In("first.mov"));
+    Copy("png.mov", In("a/last.mov"));
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    EXPECT_TRUE(Makes("last.aaf")) << Told();
+    // The row is that of the movie which came first.
+    Copy("mjpeg.mov", In("b/last.mov"));
+    EXPECT_TRUE(Tells("row 3: last may be ")) << Told();
+    Stop();
+    EXPECT_TRUE(Tells("the watch ends by signal 15")) << Told();
+}
+
 TEST_F(Watch, LooksWithoutBeingTold) {
     Copy("png.mov", In("first.mov"));
     Begin("--poll 1 --extensions MOV,mp4");
@@ -178,6 +256,19 @@ TEST_F(Watch, TellsOfFoldersThatGoAndComeBack) {
     EXPECT_TRUE(Makes("second.aaf")) << Told();
     Stop();
     EXPECT_TRUE(Tells("2 described, 0 not, 0 done already")) << Told();
+}
+
+TEST_F(Watch, TellsOfFoldersAboveThatGoAndComeBack) {
+    below_ = "above/below";
+    Begin();
+    Copy("png.mov", In("first.mov"));
+    EXPECT_TRUE(Makes("first.aaf")) << Told();
+    std::filesystem::rename(folder() / "above", folder() / "away");
+    EXPECT_TRUE(Tells("below: is not watched: ")) << Told();
+    Copy("mjpeg.mov", In("second.mov"));
+    EXPECT_TRUE(Tells("below: is there again")) << Told();
+    EXPECT_TRUE(Makes("second.aaf")) << Told();
+    Stop();
 }
 
 // What happens while the system keeps no more is found by looking at all again.

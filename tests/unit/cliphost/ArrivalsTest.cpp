@@ -81,4 +81,23 @@ TEST_F(ArrivalsTest, MayGoAway) {
     EXPECT_EQ(TakeAfter(5s), Paths{"a"});
 }
 
+TEST_F(ArrivalsTest, ComeAgainAfterTheyWereRemovedAndNobodyTold) {
+    const std::string here = (std::filesystem::temp_directory_path() / "a").string();
+    for (const std::string& file : {here, std::string("/no/such/folder/b")}) {
+        Write(file, 1);
+        See(file);
+    }
+    EXPECT_EQ(TakeAfter(5s).size(), 2u);
+    arrivals_.LookForRemoved();
+    See(here);
+    EXPECT_EQ(TakeAfter(5s), Paths{});
+    for (const std::string& file : {here, std::string("/no/such/folder/b")}) {
+        Remove(file);
+        arrivals_.LookForRemoved();
+        Write(file, 1);
+        See(file);
+    }
+    EXPECT_EQ(TakeAfter(5s), Paths{here});
+}
+
 }  // namespace

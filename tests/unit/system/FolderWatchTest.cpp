@@ -59,6 +59,18 @@ TEST_F(FolderWatchTest, TellsOfFoldersThatGo) {
     EXPECT_TRUE(IsTold(What::Gone, Path("moved")));
 }
 
+// That it was moved may be read after it was added by its new path: it has to be added again.
+TEST_F(FolderWatchTest, TellsOfFoldersThatWereAddedAgainMeanwhile) {
+    std::filesystem::create_directory(Path("in"));
+    ASSERT_EQ(watch_.Add(Path("in")), 0);
+    std::filesystem::rename(Path("in"), Path("moved"));
+    ASSERT_EQ(watch_.Add(Path("moved")), 0);
+    EXPECT_TRUE(IsTold(What::Gone, Path("moved")));
+    ASSERT_EQ(watch_.Add(Path("moved")), 0);
+    std::ofstream(Path("moved") / "a") << "x";
+    EXPECT_TRUE(IsTold(What::File, Path("moved") / "a"));
+}
+
 TEST_F(FolderWatchTest, TellsThatItMissed) {
     std::size_t most = 0;
     std::ifstream("/proc/sys/fs/inotify/max_queued_events") >> most;
