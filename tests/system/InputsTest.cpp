@@ -401,6 +401,75 @@ TEST_F(SkipDone, MakesAnewWhatChanged) {
     EXPECT_EQ(Counts(), Made(0, 4));
 }
 
+// Movies of one name keep their outputs, whichever others come or go.
+TEST_F(SkipDone, LeavesEachMovieItsOutput) {
+    using Outputs = std::map<std::string, std::string>;
+    for (const std::vector<std::string>& calls : std::vector<std::vector<std::string>>{
+             {"--jobs 1"}, {"--jobs 2"}, {"--shard 1/3", "--shard 2/3", "--shard 3/3"}}) {
+        SCOPED_TRACE(calls[0]);
+        int made = 0;
+        const auto outputs = [&] {
+            Outputs all;
+            made = 0;
+            for (const std::string& call : calls) {
+                const CommandResult ran =
+                    Run("describe --json --recursive clips --skip-done --out-dir outputs " + call);
+                for (const Json& entry : Json::parse(ran.out)) {
+                    const std::filesystem::path movie = entry["movie"].get<std::string>();
+                    const std::filesystem::path aaf = entry["aaf"].get<std::string>();
+                    EXPECT_TRUE(std::filesystem::exists(folder() / aaf)) << entry;
+                    EXPECT_TRUE(all.emplace(movie.parent_path().filename(), aaf.filename()).second);
+                    made += entry.contains("doneAlready") ? 0 : 1;
+                }
+            }
+            return all;
+        };
+        Copy("clips/b/clip.mov");
+        Copy("clips/c/clip.mov");
+        EXPECT_EQ(outputs(), (Outputs{{"b", "clip.aaf"}, {"c", "clip-2.aaf"}}));
+        EXPECT_EQ(made, 2);
+        Copy("clips/a/clip.mov");
+        const Outputs three{{"a", "clip-3.aaf"}, {"b", "clip.aaf"}, {"c", "clip-2.aaf"}};
+        EXPECT_EQ(outputs(), three) << "one before the others";
+        EXPECT_EQ(made, 1);
+        std::ofstream(folder() / "clips/c/clip.mov", std::ios::app) << "free";
+        std::ofstream(folder() / "clips/a/clip.mov", std::ios::app) << "free";
+        EXPECT_EQ(outputs(), three) << "two that changed";
+        EXPECT_EQ(made, 2);
+        std::filesystem::remove_all(folder() / "clips/b");
+        Copy("clips/d/clip.mov");
+        EXPECT_EQ(outputs(),
+                  (Outputs{{"a", "clip-3.aaf"}, {"c", "clip-2.aaf"}, {"d", "clip-4.aaf"}}))
+            << "the output of one that went is there";
+        EXPECT_EQ(made, 1);
+        std::filesystem::remove(folder() / "outputs/clip.aaf");
+        Copy("clips/e/clip.mov");
+        const Outputs last{
+            {"a", "clip-3.aaf"}, {"c", "clip-2.aaf"}, {"d", "clip-4.aaf"}, {"e", "clip.aaf"}};
+        EXPECT_EQ(outputs(), last) << "it was taken away";
+        EXPECT_EQ(outputs(), last);
+        EXPECT_EQ(made, 0);
+        EXPECT_EQ(NamesIn(folder() / "outputs"),
+                  (Names{kRecords, "clip.aaf", "clip-2.aaf", "clip-3.aaf", "clip-4.aaf"}));
+        std::filesystem::remove_all(folder() / "clips");
+        std::filesystem::remove_all(folder() / "outputs");
+    }
+}
+
+// A part of the movies, other options, and a movie that is given twice.
+TEST_F(SkipDone, KnowsOutputsInOtherCalls) {
+    Counts();
+    const std::string call = "describe --json --skip-done --out-dir out ";
+    const auto aafOf = [&](const std::string& arguments, std::size_t place = 0) {
+        return Json::parse(Run(call + arguments).out).at(place)["aaf"];
+    };
+    EXPECT_EQ(aafOf("in/sub/a.mov"), "out/a-2.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov --use-alpha"), "out/a-2.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov in/sub/a.mov", 1), "out/a-3.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov in/sub/a.mov"), "out/a-2.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov in/sub/a.mov", 1), "out/a-3.aaf");
+}
+
 TEST_F(SkipDone, MakesAnewWithOtherOptions) {
     const auto expectNew = [&](const std::string& more) {
         EXPECT_EQ(Counts(more), Made(3, 0)) << more;
