@@ -280,6 +280,33 @@ TEST_F(Inputs, AreShownInLinesThatAreTheEntriesOfAList) {
     EXPECT_FALSE(entries[0]["description"].empty());
 }
 
+TEST_F(Inputs, AreShownInLinesBySheetsAndCatalogsToo) {
+    const std::string good = Copy("in/a.mov");
+    Copy("in/b\xFF\n.mov");
+    const std::string bad = Write(movies::Bytes(100, 'x'), "in/text.mov");
+    for (const std::string call :
+         {"contact --frames 1 --width 16 --out-dir out", "catalog -o all.sqlite"}) {
+        const std::string output = call[2] == 'n' ? "out/a.png" : "all.sqlite";
+        const CommandResult ran = RunAlike(call + " --jsonl in absent.mov");
+        EXPECT_EQ(ran.status, 2);
+        const std::vector<Json> lines = LinesOf(ran.out);
+        ASSERT_EQ(lines.size(), 4u) << ran.out;
+        EXPECT_EQ(lines[0],
+                  Json({{"schema", lines[0]["schema"]}, {"movie", good}, {"output", output}}));
+        EXPECT_TRUE(std::filesystem::exists(folder() / output));
+        EXPECT_TRUE(lines[1].contains("output")) << lines[1];
+        EXPECT_EQ(lines[2]["movie"], bad);
+        EXPECT_FALSE(lines[2].contains("output"));
+        EXPECT_EQ(lines[3]["movie"], "absent.mov");
+        EXPECT_EQ(lines[3]["reason"], "there is no such file or folder");
+    }
+    const CommandResult update = Run("catalog -o all.sqlite --update --jsonl in/a.mov");
+    EXPECT_EQ(LinesOf(update.out).at(0)["doneAlready"], true);
+    EXPECT_EQ(LinesOf(update.out).size(), 1u) << "and no summary";
+    ExpectSays(RunCliphost("contact a.mov --jsonl -o -"), 2, "standard output takes the JSON");
+    ExpectSays(RunCliphost("catalog --merge a b -o c --jsonl"), 2, "excludes");
+}
+
 // A program that reads them need not wait for the last movie.
 TEST_F(Inputs, AreShownAtOnceInLines) {
     Copy("in/a.mov");
