@@ -31,9 +31,13 @@ function(list_rows)
       endif()
     endif()
   endforeach()
-  # Whoever reads the list meanwhile reads the former one whole.
-  file(WRITE "${rows}.new" "${script}")
-  file(RENAME "${rows}.new" "${rows}")
+  if(script STREQUAL "")
+    message(FATAL_ERROR "${name} lists no tests")
+  endif()
+  # Whoever reads the list meanwhile reads the former one whole, and several may write it at a time.
+  string(RANDOM LENGTH 12 suffix)
+  file(WRITE "${rows}.${suffix}" "${script}")
+  file(RENAME "${rows}.${suffix}" "${rows}")
 endfunction()
 
 # A suite's name may have an instance's before it and a type's number behind it.

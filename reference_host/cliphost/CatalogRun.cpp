@@ -9,6 +9,7 @@
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/GoneMovies.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MovieThumbnail.h"
 #include "reference_host/cliphost/Notice.h"
@@ -125,6 +126,17 @@ bool CatalogRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
 void CatalogRun::Show(const std::filesystem::path& movie, const MovieAnswer& answer,
                       const std::filesystem::path&) {
     Add(movie, EntryFrom(answer.description), false);
+    if (options_.lines) {
+        PrintMovieLine(schema::kCatalogLine, movie,
+                       {{"output", MachinePath(options_.movies.together)}});
+    }
+}
+
+void CatalogRun::ShowDone(const std::filesystem::path& movie, const std::filesystem::path&) {
+    if (options_.lines) {
+        PrintMovieLine(schema::kCatalogLine, movie,
+                       {{"output", MachinePath(options_.movies.together)}, {"doneAlready", true}});
+    }
 }
 
 void CatalogRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
@@ -135,6 +147,9 @@ void CatalogRun::ShowFailure(const std::filesystem::path& movie, const Problem& 
     }
     entry["warnings"].push_back(WarningRow(problem, "failure", 0));
     Add(movie, std::move(entry), true);
+    if (options_.lines) {
+        PrintFailureLine(schema::kCatalogLine, movie, problem);
+    }
 }
 
 void CatalogRun::Add(const std::filesystem::path& movie, catalog::Entry entry, bool hasFailed) {
@@ -197,6 +212,9 @@ void CatalogRun::Finish(int read, int failed) {
     const std::size_t gone = updated_ && !IsStopped() ? RemoveGone() : 0;
     if (made_ && !(IsStopped() && made_->TakesPlace())) {
         made_->Finish();
+    }
+    if (options_.lines) {
+        return;
     }
     std::string summary = fmt::format("{} catalogued, {} not", read, failed);
     if (updated_) {

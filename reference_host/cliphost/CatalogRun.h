@@ -24,6 +24,7 @@ struct CatalogOptions {
     MoviesOptions movies;  // `together` is the catalog
     CatalogForm form;
     bool update = false;
+    bool lines = false;  // JSON of one line for each movie
 };
 
 // Describes a movie; what a catalog keeps of it is the answer's description, as JSON.
@@ -43,6 +44,7 @@ private:
     void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
               const std::filesystem::path& saved) override;
     void ShowFailure(const std::filesystem::path& movie, const Problem& problem) override;
+    void ShowDone(const std::filesystem::path& movie, const std::filesystem::path& saved) override;
     bool Collects() const override { return false; }
     bool LooksFirst() const override { return true; }
     bool IsDoneAlready(std::size_t place, const MovieStep& step,

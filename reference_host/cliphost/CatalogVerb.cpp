@@ -3,6 +3,7 @@
 
 #include "reference_host/cliphost/CatalogRun.h"
 #include "reference_host/cliphost/InputOptions.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
@@ -42,6 +43,7 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost catalog FOLDER -o clips.sqlite --recursive --extensions mov,mxf --update\n"
         "  cliphost catalog FOLDER -o clips.sqlite --thumbnails\n"
         "  cliphost catalog --files-from LIST -o part2.sqlite --shard 2/16 --update\n"
+        "  cliphost catalog --files-from LIST -o clips.sqlite --jsonl\n"
         "  cliphost catalog --merge part1.sqlite part2.sqlite -o clips.sqlite\n\n"
         "Without --update, a catalog that is there is replaced. A movie that can't be described is "
         "in the\ncatalog too, with the reason.");
@@ -57,11 +59,13 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
                                        "that several have, the one that was read last counts");
     merge->excludes(update);
     AddForm(*verb, options->form);
+    verb->add_flag("--jsonl", options->lines, kMovieLinesHelp);
     AddInputOptions(*verb, options->movies);
     AddWorkerOptions(*verb, options->movies.workers);
     // It reads no movie.
-    for (const char* const other : {"--thumbnails", "--files-from", "--recursive", "--extensions",
-                                    "--shard", "--jobs", "--limit-seconds", "--limit-memory"}) {
+    for (const char* const other :
+         {"--thumbnails", "--jsonl", "--files-from", "--recursive", "--extensions", "--shard",
+          "--jobs", "--limit-seconds", "--limit-memory"}) {
         merge->excludes(other);
     }
     AddCatalogForParent(app, session, status);
@@ -72,10 +76,12 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
                 MergeCatalogs(options->movies.paths, options->movies.together, session.verbosity);
             return;
         }
-        TakeWorkerVerb(app, *verb, "catalog-for-parent", session, options->movies.workers);
-        Session running(session);
-        status = WithCatalog(options->movies.together,
-                             [&] { return CatalogRun(running, *options).Run(); });
+        AnswerFailureInLine(options->lines, schema::kCatalogLine, [&] {
+            TakeWorkerVerb(app, *verb, "catalog-for-parent", session, options->movies.workers);
+            Session running(session);
+            status = WithCatalog(options->movies.together,
+                                 [&] { return CatalogRun(running, *options).Run(); });
+        });
     });
 }
 

@@ -3,11 +3,13 @@
 #include <fmt/format.h>
 
 #include "reference_host/cliphost/InputOptions.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/SheetRun.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
+#include "reference_host/system/OutputStream.h"
 
 namespace cliphost {
 namespace {
@@ -48,7 +50,7 @@ void AddContactForParent(CLI::App& app, const SessionOptions& session, int& stat
 }
 
 // What the command line says of the places for sheets.
-void CheckPlaces(const MoviesOptions& movies) {
+void CheckPlaces(const MoviesOptions& movies, bool printsJson) {
     if (!movies.Saves()) {
         throw Failure(kExitCaller, "--output", "there is no place for the sheet",
                       "give -o FILE.png for one movie, or --out-dir FOLDER");
@@ -58,6 +60,9 @@ void CheckPlaces(const MoviesOptions& movies) {
     }
     if (movies.paths.size() != 1 || std::filesystem::is_directory(movies.paths[0])) {
         throw Failure(kExitCaller, "--output", "it takes one movie", "use --out-dir for several");
+    }
+    if (printsJson && host::system::IsStandardOutput(movies.file)) {
+        throw Failure(kExitCaller, "--output", "standard output takes the JSON", "name a file");
     }
     RefuseOutputOntoMovie(movies.file, movies.paths[0]);
     const std::string ending = movies.file.extension().string();
@@ -79,7 +84,8 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost contact clip.mov --frames 30 --columns 6 --width 200 --exact -o sheet.png\n"
         "  cliphost contact FOLDER --out-dir sheets\n"
         "  cliphost contact FOLDER --out-dir sheets --recursive --extensions mov,mp4 "
-        "--skip-done\n\n"
+        "--skip-done\n"
+        "  cliphost contact --files-from LIST --out-dir sheets --jsonl\n\n"
         "With --use-alpha transparent parts show a checkerboard.");
     auto options = std::make_shared<SheetsOptions>();
     MoviesOptions& movies = options->movies;
@@ -89,17 +95,21 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_option("--out-dir", movies.outFolder, "Write every movie's sheet into this folder")
         ->excludes(output);
     AddSheetForm(*verb, options->form);
+    verb->add_flag("--jsonl", options->lines, kMovieLinesHelp);
     AddInputOptions(*verb, movies, *output);
     AddWorkerOptions(*verb, movies.workers);
     AddContactForParent(app, session, status);
     verb->callback([&app, verb, &session, &status, options] {
         MoviesOptions& asked = options->movies;
         NeedInputs(asked);
-        CheckPlaces(asked);
-        options->form.showsProgress = asked.paths.size() == 1 && !asked.file.empty();
-        TakeWorkerVerb(app, *verb, "contact-for-parent", session, asked.workers);
-        Session running(session);
-        status = SheetRun(running, *options).Run();
+        const auto work = [&] {
+            CheckPlaces(asked, options->lines);
+            options->form.showsProgress = asked.paths.size() == 1 && !asked.file.empty();
+            TakeWorkerVerb(app, *verb, "contact-for-parent", session, asked.workers);
+            Session running(session);
+            status = SheetRun(running, *options).Run();
+        };
+        AnswerFailureInLine(options->lines, schema::kContactLine, work);
     });
 }
 

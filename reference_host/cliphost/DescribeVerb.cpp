@@ -180,7 +180,7 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             }
         };
         if (options->form.lines) {
-            AnswerFailureInLine(schema::kDescribe, work);
+            AnswerFailureInLine(true, schema::kDescribe, work);
         } else {
             AnswerFailureToo(options->form.json, schema::kDescribe, nlohmann::ordered_json::array(),
                              work);

@@ -8,6 +8,7 @@
 #include <fstream>
 #include <nlohmann/json.hpp>
 #include <random>
+#include <tuple>
 
 #include "host_interfaces/Version.h"
 #include "reference_host/cliphost/Failure.h"
@@ -46,6 +47,11 @@ std::string DigestTextOfFile(const std::filesystem::path& file) {
     return digest ? TextOf(*digest) : "none";
 }
 
+std::string BytesOfDigest(const std::string& text) {
+    const Digest digest = DigestOf(text);
+    return {digest.begin(), digest.end()};
+}
+
 [[noreturn]] void FailToKeep(Problem problem) {
     problem.hint = "--skip-done will not find the outputs of this run";
     throw Failure(kExitCaller, std::move(problem));
@@ -81,8 +87,7 @@ std::string SettingsText(const Session& session, const std::vector<std::string>&
 }
 
 std::string DoneMovies::KeyOf(const std::string& movie, const std::string& output) const {
-    const Digest digest = DigestOf(movie + '\0' + output);
-    return {digest.begin(), digest.end()};
+    return BytesOfDigest(movie + '\0' + output);
 }
 
 std::vector<std::filesystem::path> DoneMovies::Load() {
@@ -103,11 +108,24 @@ std::vector<std::filesystem::path> DoneMovies::Load() {
             unread.push_back(entry->path());
         }
     }
+    outputsByOwner_.clear();
+    for (const auto& [output, owner] : owners_) {
+        outputsByOwner_.emplace(owner.movie, output);
+    }
     std::sort(unread.begin(), unread.end());
     return unread;
 }
 
-// A line that is none, or of other settings, is passed over.
+// The files come in any order; the date tells which line is the last.
+void DoneMovies::NoteOwner(const std::string& movie, const std::string& output, std::int64_t date) {
+    Owner owner{date, BytesOfDigest(movie)};
+    Owner& last = owners_[output];
+    if (last.movie.empty() || std::tie(last.date, last.movie) < std::tie(owner.date, owner.movie)) {
+        last = std::move(owner);
+    }
+}
+
+// A line that is none is passed over. One of other settings tells the name of the output alone.
 void DoneMovies::LoadLine(const std::string& line) {
     const ordered_json json = ordered_json::parse(line, nullptr, false);
     if (!json.is_object()) {
@@ -128,8 +146,12 @@ void DoneMovies::LoadLine(const std::string& line) {
         return isThere;
     };
     Output output;
-    if (text("settings") == settings_ && state("size", "date", output.movie) &&
-        state("outputSize", "outputDate", output.state)) {
+    if (!state("size", "date", output.movie) || !state("outputSize", "outputDate", output.state) ||
+        text("movie").empty() || text("output").empty()) {
+        return;
+    }
+    NoteOwner(text("movie"), text("output"), output.state.date);
+    if (text("settings") == settings_) {
         output.digest = text("outputDigest");
         outputs_.emplace(KeyOf(text("movie"), text("output")), std::move(output));
     }
@@ -158,6 +180,23 @@ bool DoneMovies::Has(const std::filesystem::path& movie, const FileState& state,
                }
                return !known.digest.empty() && known.digest == digest;
            });
+}
+
+std::vector<std::filesystem::path> DoneMovies::OutputsOf(const std::filesystem::path& movie) const {
+    std::vector<std::filesystem::path> outputs;
+    const auto [first, last] =
+        outputsByOwner_.equal_range(BytesOfDigest(AbsoluteMachinePath(movie)));
+    std::for_each(first, last, [&](const auto& entry) {
+        std::string name;
+        if (host::text::PercentDecoded(entry.second, name)) {
+            outputs.emplace_back(name);
+        }
+    });
+    return outputs;
+}
+
+bool DoneMovies::Keeps(const std::filesystem::path& output) const {
+    return owners_.count(PercentEncoded(output.native())) > 0 && StateOf(outFolder_ / output);
 }
 
 void DoneMovies::Begin() {

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <optional>
 #include <string>
@@ -37,6 +38,12 @@ public:
     bool Has(const std::filesystem::path& movie, const host::system::FileState& state,
              const std::filesystem::path& output) const;
 
+    // The names of a movie's outputs, whatever their settings. What several movies had in turn
+    // is the last one's.
+    std::vector<std::filesystem::path> OutputsOf(const std::filesystem::path& movie) const;
+    // Whether an output of that name was written down and is there.
+    bool Keeps(const std::filesystem::path& output) const;
+
     // How an output is known again: where its date is not that of the line, as in a copy of the
     // folder, by its content.
     enum class Known { ByDate, ByContent };
@@ -53,11 +60,19 @@ private:
 
     std::string KeyOf(const std::string& movie, const std::string& output) const;
     void LoadLine(const std::string& line);
+    void NoteOwner(const std::string& movie, const std::string& output, std::int64_t date);
     void Begin();
 
     std::filesystem::path outFolder_;
     std::string settings_;
     std::unordered_multimap<std::string, Output> outputs_;  // by a digest of both paths
+    // Names are in the form of the lines, and of a movie's path there is a digest.
+    struct Owner {
+        std::int64_t date = 0;  // of the output
+        std::string movie;
+    };
+    std::unordered_map<std::string, Owner> owners_;  // by the output
+    std::unordered_multimap<std::string, std::string> outputsByOwner_;
     std::filesystem::path written_;
     host::system::OutputStream stream_;
 };

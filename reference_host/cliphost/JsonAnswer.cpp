@@ -8,6 +8,8 @@
 #include <cstdio>
 #include <system_error>
 
+#include "reference_host/cliphost/MachinePath.h"
+
 namespace cliphost {
 
 using nlohmann::ordered_json;
@@ -44,6 +46,23 @@ void PrintJsonLine(std::string_view json) {
     if (std::fflush(stdout) != 0) {
         throw std::system_error(errno, std::generic_category(), "standard output");
     }
+}
+
+void PrintMovieLine(const char* schema, const std::filesystem::path& movie,
+                    const ordered_json& members) {
+    ordered_json line = {{schema::kMember, schema}};
+    if (!movie.empty()) {
+        line["movie"] = MachinePath(movie);
+    }
+    line.update(members);
+    PrintJsonLine(line.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace));
+}
+
+void PrintFailureLine(const char* schema, const std::filesystem::path& movie,
+                      const Problem& problem) {
+    ordered_json members;
+    AddProblem(problem, members);
+    PrintMovieLine(schema, movie, members);
 }
 
 }  // namespace cliphost

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <filesystem>
 #include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/Failure.h"
@@ -18,6 +19,13 @@ void PrintJson(const char* schema, nlohmann::ordered_json answer);
 
 // Prints JSON in one line, at once.
 void PrintJsonLine(std::string_view json);
+
+// Prints such a line: the movie, and what became of it.
+void PrintMovieLine(const char* schema, const std::filesystem::path& movie,
+                    const nlohmann::ordered_json& members);
+// The same of a movie that failed.
+void PrintFailureLine(const char* schema, const std::filesystem::path& movie,
+                      const Problem& problem);
 
 // Does a verb's work. With `json`, its failure is also written to standard output:
 // `head`, which may name the movie or folder, and the problem. A verb that answers
@@ -36,15 +44,19 @@ void AnswerFailureToo(bool json, const char* schema, nlohmann::ordered_json head
     }
 }
 
+inline constexpr char kMovieLinesHelp[] =
+    "As JSON, a line for each movie as soon as it is done: its path, and what was written or why "
+    "nothing was";
+
 // The same where each answer is a line.
 template <class Work>
-void AnswerFailureInLine(const char* schema, const Work& work) {
+void AnswerFailureInLine(bool lines, const char* schema, const Work& work) {
     try {
         work();
     } catch (const Failure& failure) {
-        nlohmann::ordered_json line = WithSchema(schema, nlohmann::ordered_json::object());
-        AddProblem(failure.problem(), line);
-        PrintJsonLine(line.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace));
+        if (lines) {
+            PrintFailureLine(schema, {}, failure.problem());
+        }
         throw;
     }
 }

@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include <algorithm>
+#include <string_view>
 
 #include "host_interfaces/Version.h"
 #include "reference_host/cliphost/HelpWords.h"
@@ -70,6 +71,41 @@ std::string Options(const HelpVerb& verb) {
     return text;
 }
 
+// The help's last words by paragraphs: those that begin with a title are sections of their own.
+std::string LastSections(const std::string& footer) {
+    struct Section {
+        std::string_view title;
+        std::string_view start;  // of a paragraph in it
+        std::string text = {};
+    };
+    Section sections[] = {
+        {"EXIT STATUS", "Exit status: "}, {"NOTES", ""}, {"EXAMPLES", "Examples:\n"}};
+    Section& notes = sections[1];
+    constexpr std::string_view kBetween = "\n\n";
+    for (std::size_t at = 0, end = 0; at < footer.size(); at = end + kBetween.size()) {
+        end = std::min(footer.find(kBetween, at), footer.size());
+        std::string_view paragraph = std::string_view(footer).substr(at, end - at);
+        Section* place = &notes;
+        for (Section& section : sections) {
+            if (!section.start.empty() &&
+                paragraph.substr(0, section.start.size()) == section.start) {
+                place = &section;
+            }
+        }
+        paragraph.remove_prefix(place->start.size());
+        place->text.append(place->text.empty() ? "" : kBetween).append(paragraph);
+    }
+    std::string page;
+    for (const Section& section : sections) {
+        if (!section.text.empty()) {
+            // Lines stay lines.
+            page.append(".SH ").append(section.title);
+            page += "\n.nf\n" + Roff(section.text) + "\n.fi\n";
+        }
+    }
+    return page;
+}
+
 std::string Verbs(const std::vector<HelpVerb>& verbs) {
     std::string text = ".SH VERBS\n";
     for (const HelpVerb& verb : verbs) {
@@ -90,8 +126,7 @@ std::string ManPage(const std::vector<HelpVerb>& verbs, std::size_t which) {
     page += ".SH SYNOPSIS\n" + Call(verb);
     page += verb.name.empty() ? Verbs(verbs) : std::string();
     page += Options(verb);
-    // Lines of examples and exit statuses stay lines.
-    page += ".SH NOTES\n.nf\n" + Roff(verb.footer) + "\n.fi\n";
+    page += LastSections(verb.footer);
     page += ".SH SEE ALSO\n";
     return page + (verb.name.empty() ? ".BR cliphost\\-describe (1)\n" : ".BR cliphost (1)\n");
 }

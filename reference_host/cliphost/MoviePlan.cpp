@@ -4,8 +4,12 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+#include <charconv>
+#include <set>
 #include <utility>
 
+#include "reference_host/cliphost/DoneMovies.h"
 #include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Words.h"
@@ -30,10 +34,11 @@ std::string NamesInWords(const std::vector<std::string>& endings) {
 class MoviePlanner {
 public:
     MoviePlanner(Session& session, const MoviesOptions& options, const char* ending,
-                 MoviePlan& plan)
+                 const DoneMovies* done, MoviePlan& plan)
         : session_(session),
           options_(options),
           ending_(ending),
+          done_(done),
           plan_(plan),
           hasNumbers_(!options.outFolder.empty() &&
                       (options.skipDone || !options.shard.IsWhole() || options.names)),
@@ -102,13 +107,40 @@ private:
         if (known && *known != 0) {
             return *known;
         }
-        unsigned& number = names_.lastNumbers[OutputName(movie, 1, ending_)];
-        while (!names_.taken.insert(OutputName(movie, ++number, ending_)).second) {
-        }
+        unsigned number = RecordedNumber(movie);
+        number = number == 0 ? NewNumber(movie) : number;
         if (known) {
             *known = number;
         }
         return number;
+    }
+
+    bool Takes(const std::filesystem::path& name) { return names_.taken.insert(name).second; }
+
+    // 0 for a movie that is in no record. One that is given twice has two outputs.
+    unsigned RecordedNumber(const std::filesystem::path& movie) {
+        std::set<unsigned> numbers;
+        if (done_) {
+            for (const std::filesystem::path& output : done_->OutputsOf(movie)) {
+                numbers.insert(NumberInName(output, movie, ending_));
+            }
+        }
+        const auto free = std::find_if(numbers.begin(), numbers.end(), [&](unsigned number) {
+            return number != 0 && Takes(OutputName(movie, number, ending_));
+        });
+        return free == numbers.end() ? 0 : *free;
+    }
+
+    // The record of a run that goes on meanwhile, on another share, changes no number: what it
+    // holds was given in this way.
+    unsigned NewNumber(const std::filesystem::path& movie) {
+        unsigned& number = names_.lastNumbers[OutputName(movie, 1, ending_)];
+        for (;;) {
+            const std::filesystem::path name = OutputName(movie, ++number, ending_);
+            if (!(done_ && done_->Keeps(name)) && Takes(name)) {
+                return number;
+            }
+        }
     }
 
     void Refuse(const std::filesystem::path& path, int status, const Problem& problem) {
@@ -198,6 +230,7 @@ private:
     Session& session_;
     const MoviesOptions& options_;
     const char* const ending_;
+    const DoneMovies* const done_;  // or null
     MoviePlan& plan_;
     const bool hasNumbers_;
     OutputNames ownNames_;
@@ -206,8 +239,9 @@ private:
     std::filesystem::path firstMovie_;  // of the folder at hand
 };
 
-MoviePlan::MoviePlan(Session& session, const MoviesOptions& options, const char* ending) {
-    MoviePlanner planner(session, options, ending, *this);
+MoviePlan::MoviePlan(Session& session, const MoviesOptions& options, const char* ending,
+                     const DoneMovies* done) {
+    MoviePlanner planner(session, options, ending, done, *this);
     for (const std::filesystem::path& path : options.paths) {
         planner.Add(path);
     }
@@ -258,6 +292,18 @@ std::filesystem::path OutputName(const std::filesystem::path& movie, unsigned nu
     std::filesystem::path name = movie.stem();
     name += number == 1 ? ending : fmt::format("-{}{}", number, ending);
     return name;
+}
+
+unsigned NumberInName(const std::filesystem::path& name, const std::filesystem::path& movie,
+                      const char* ending) {
+    const std::string stem = movie.stem();
+    const std::string& text = name.native();
+    const std::size_t from = stem.size() + 1;  // behind the hyphen
+    unsigned number = 1;
+    if (text.size() > from) {
+        std::from_chars(text.data() + from, text.data() + text.size(), number);
+    }
+    return OutputName(movie, number, ending) == name ? number : 0;
 }
 
 }  // namespace cliphost

@@ -19,6 +19,8 @@
 
 namespace cliphost {
 
+class DoneMovies;
+
 // The names that outputs have, where plans follow each other: a movie that comes again keeps its
 // own.
 struct OutputNames {
@@ -62,8 +64,10 @@ class MoviePlan {
 public:
     // Where outputs need the same name in every run and on every machine, each movie has a number
     // in its output's name: the place among all movies of that name, those of other shares too.
-    // `ending` is that of the outputs. Throws a Failure for a list that can't be read.
-    MoviePlan(Session& session, const MoviesOptions& options, const char* ending);
+    // A movie of `done` keeps its number, and no other has that of an output of `done`; it may be
+    // null. `ending` is that of the outputs. Throws a Failure for a list that can't be read.
+    MoviePlan(Session& session, const MoviesOptions& options, const char* ending,
+              const DoneMovies* done);
 
     // Steps of other shares are not among them.
     std::size_t size() const { return steps_.size(); }
@@ -110,5 +114,9 @@ private:
 // The name of what is made of a movie. Movies of one name in different folders have numbers.
 std::filesystem::path OutputName(const std::filesystem::path& movie, unsigned number,
                                  const char* ending);
+
+// The number in such a name; 0 for a name that is none of this movie and ending.
+unsigned NumberInName(const std::filesystem::path& name, const std::filesystem::path& movie,
+                      const char* ending);
 
 }  // namespace cliphost

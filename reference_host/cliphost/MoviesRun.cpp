@@ -63,7 +63,18 @@ void MoviesRun::Begin() {
     guarded_.reset();
     outputs_.clear();
     countedBefore_ = done_ + doneBefore_ + failed_;
-    plan_.emplace(session_, options_, ending_);
+    LoadDone();
+    plan_.emplace(session_, options_, ending_, doneMovies_ ? &*doneMovies_ : nullptr);
+}
+
+void MoviesRun::LoadDone() {
+    if (!options_.skipDone || doneMovies_) {
+        return;
+    }
+    doneMovies_.emplace(options_.outFolder, SettingsText(session_, options_.workers.arguments));
+    for (const std::filesystem::path& file : doneMovies_->Load()) {
+        Notice("cliphost: {}: can't be read; what it tells of is done again\n", DisplayPath(file));
+    }
 }
 
 // Signals are noted from the plan on; the folder, if the run made it, goes where nothing lies in
@@ -130,13 +141,6 @@ bool MoviesRun::IsForWorkers() const {
 }
 
 void MoviesRun::LookAtMovies() {
-    if (options_.skipDone && !doneMovies_) {
-        doneMovies_.emplace(options_.outFolder, SettingsText(session_, options_.workers.arguments));
-        for (const std::filesystem::path& file : doneMovies_->Load()) {
-            Notice("cliphost: {}: can't be read; what it tells of is done again\n",
-                   DisplayPath(file));
-        }
-    }
     looks_.resize(plan().size());
     for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
         const MovieStep step = plan()[i];

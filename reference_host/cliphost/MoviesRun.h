@@ -84,6 +84,8 @@ protected:
 private:
     struct Held;
     void Begin();
+    // Reads the record of the runs before, where the options ask for it.
+    void LoadDone();
     void DoPlan(Held& held);
     void RefuseOneForAllOntoMovie() const;
     bool IsForWorkers() const;

@@ -6,6 +6,8 @@
 
 #include "reference_host/cliphost/ContactSheet.h"
 #include "reference_host/cliphost/FrameRange.h"
+#include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/PngFile.h"
 #include "reference_host/cliphost/SheetPictures.h"
@@ -71,15 +73,34 @@ MovieAnswer MakeSheet(Session& session, const std::filesystem::path& movie, cons
     return answer;
 }
 
-void SheetRun::Show(const std::filesystem::path&, const MovieAnswer& answer,
+void SheetRun::Show(const std::filesystem::path& movie, const MovieAnswer& answer,
                     const std::filesystem::path& saved) {
-    if (!host::system::IsStandardOutput(saved)) {
+    if (options_.lines) {
+        nlohmann::ordered_json members = {{"output", MachinePath(saved)}};
+        if (answer.isPartial) {
+            members["isPartial"] = true;
+        }
+        PrintMovieLine(schema::kContactLine, movie, members);
+    } else if (!host::system::IsStandardOutput(saved)) {
         fmt::print("{}: {}\n", host::DisplayPath(saved), answer.description);
     }
 }
 
+void SheetRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    if (options_.lines) {
+        PrintFailureLine(schema::kContactLine, movie, problem);
+    }
+}
+
+void SheetRun::ShowDone(const std::filesystem::path& movie, const std::filesystem::path& saved) {
+    if (options_.lines) {
+        PrintMovieLine(schema::kContactLine, movie,
+                       {{"output", MachinePath(saved)}, {"doneAlready", true}});
+    }
+}
+
 void SheetRun::Finish(int made, int failed) {
-    if (doneBefore() > 0) {
+    if (doneBefore() > 0 && !options_.lines) {
         fmt::print("{} made, {} not, {} done already\n", made, failed, doneBefore());
     }
 }

@@ -27,6 +27,7 @@ MovieAnswer MakeSheet(Session& session, const std::filesystem::path& movie, cons
 struct SheetsOptions {
     MoviesOptions movies;
     SheetForm form;
+    bool lines = false;  // JSON of one line for each movie
 };
 
 // Writes the sheets of all movies of the command line.
@@ -44,6 +45,8 @@ private:
     }
     void Show(const std::filesystem::path& movie, const MovieAnswer& answer,
               const std::filesystem::path& saved) override;
+    void ShowFailure(const std::filesystem::path& movie, const Problem& problem) override;
+    void ShowDone(const std::filesystem::path& movie, const std::filesystem::path& saved) override;
     void Finish(int made, int failed) override;
 
     const SheetsOptions& options_;

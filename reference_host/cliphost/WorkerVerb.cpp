@@ -29,6 +29,11 @@ MovieAnswer AnswerOfMovie(const std::filesystem::path& movie,
         throw;
     } catch (const Failure& failure) {
         return Failed(failure.status(), failure.problem());
+    } catch (const std::filesystem::filesystem_error& error) {
+        // Most often a file that is not the movie, such as the folder of an output.
+        Problem problem{error.path1().empty() ? movie : error.path1(), error.code().message()};
+        const int status = StatusOf(problem);
+        return Failed(status, std::move(problem));
     } catch (const std::exception& error) {
         return Failed(kExitFile, {movie, error.what()});
     }

@@ -6,7 +6,8 @@
 # their own; settings, keys, logs and sockets are in FOLDER, and a Slurm that the machine has is left alone.
 # FOLDER is an absolute path without blanks.
 
-slurm_daemons=()
+slurm='' slurm_daemons=()
+slurm_patience=20 # seconds for what is asked to end
 
 # daemon NAME COMMAND ...: COMMAND stays in its process, which is known so; Ctrl-C is for others.
 daemon() {
@@ -50,13 +51,14 @@ start_munge() {
 are_idle() { [ "$(sinfo --noheader --states=idle --format=%D 2>/dev/null)" = "$1" ]; }
 
 start_slurm() {
+  # Of this name first: by it all that belongs to this Slurm is found at the end.
+  export SLURM_CONF=$1/slurm.conf
   slurm=$1
   shift
   local ports host node
   read -ra ports < <(free_ports $(($# + 1)))
   host=$(hostname -s)
   mkdir -p "$slurm/state"
-  export SLURM_CONF=$slurm/slurm.conf
   {
     cat <<CONF
 ClusterName=farm
@@ -105,18 +107,26 @@ slurm_processes() {
 
 has_no_job() { [ -z "$(timeout 5 squeue --noheader 2>/dev/null)" ]; }
 
-# Ends everything that start_slurm and the jobs started.
+have_ended() { ! kill -0 "$@" 2>/dev/null; }
+
+# end_daemons PROCESS ...: asks them to end, and waits a while.
+end_daemons() {
+  (($#)) || return 0
+  kill "$@" 2>/dev/null
+  until_true "$slurm_patience" have_ended "$@"
+}
+
+# Ends everything that start_slurm and the jobs started, also when it was interrupted before a daemon was
+# noted. What does not end when it is asked is killed.
 stop_slurm() {
   local left
-  ((${#slurm_daemons[@]})) || return 0
+  [ -n "$slurm" ] || return 0
   timeout 10 scancel --quiet --full --user="$(id -un)" 2>/dev/null
   until_true 10 has_no_job
   # The key's keeper goes last, since the others talk by it.
-  kill "${slurm_daemons[@]:1}" 2>/dev/null
-  wait "${slurm_daemons[@]:1}" 2>/dev/null
-  kill "${slurm_daemons[0]}" 2>/dev/null
-  wait "${slurm_daemons[0]}" 2>/dev/null
+  end_daemons "${slurm_daemons[@]:1}"
+  end_daemons "${slurm_daemons[@]:0:1}"
   mapfile -t left < <(slurm_processes)
   ((${#left[@]} == 0)) || kill -KILL "${left[@]}" 2>/dev/null
-  slurm_daemons=()
+  slurm='' slurm_daemons=()
 }

@@ -305,6 +305,33 @@ TEST_F(Inputs, AreShownInLinesThatAreTheEntriesOfAList) {
     EXPECT_FALSE(entries[0]["description"].empty());
 }
 
+TEST_F(Inputs, AreShownInLinesBySheetsAndCatalogsToo) {
+    const std::string good = Copy("in/a.mov");
+    Copy("in/b\xFF\n.mov");
+    const std::string bad = Write(movies::Bytes(100, 'x'), "in/text.mov");
+    for (const std::string call :
+         {"contact --frames 1 --width 16 --out-dir out", "catalog -o all.sqlite"}) {
+        const std::string output = call[2] == 'n' ? "out/a.png" : "all.sqlite";
+        const CommandResult ran = RunAlike(call + " --jsonl in absent.mov");
+        EXPECT_EQ(ran.status, 2);
+        const std::vector<Json> lines = LinesOf(ran.out);
+        ASSERT_EQ(lines.size(), 4u) << ran.out;
+        EXPECT_EQ(lines[0],
+                  Json({{"schema", lines[0]["schema"]}, {"movie", good}, {"output", output}}));
+        EXPECT_TRUE(std::filesystem::exists(folder() / output));
+        EXPECT_TRUE(lines[1].contains("output")) << lines[1];
+        EXPECT_EQ(lines[2]["movie"], bad);
+        EXPECT_FALSE(lines[2].contains("output"));
+        EXPECT_EQ(lines[3]["movie"], "absent.mov");
+        EXPECT_EQ(lines[3]["reason"], "there is no such file or folder");
+    }
+    const CommandResult update = Run("catalog -o all.sqlite --update --jsonl in/a.mov");
+    EXPECT_EQ(LinesOf(update.out).at(0)["doneAlready"], true);
+    EXPECT_EQ(LinesOf(update.out).size(), 1u) << "and no summary";
+    ExpectSays(RunCliphost("contact a.mov --jsonl -o -"), 2, "standard output takes the JSON");
+    ExpectSays(RunCliphost("catalog --merge a b -o c --jsonl"), 2, "excludes");
+}
+
 // A program that reads them need not wait for the last movie.
 TEST_F(Inputs, AreShownAtOnceInLines) {
     Copy("in/a.mov");
@@ -424,6 +451,75 @@ TEST_F(SkipDone, MakesAnewWhatChanged) {
     Copy("in/c.mov");
     EXPECT_EQ(Counts(), Made(1, 3));
     EXPECT_EQ(Counts(), Made(0, 4));
+}
+
+// Movies of one name keep their outputs, whichever others come or go.
+TEST_F(SkipDone, LeavesEachMovieItsOutput) {
+    using Outputs = std::map<std::string, std::string>;
+    for (const std::vector<std::string>& calls : std::vector<std::vector<std::string>>{
+             {"--jobs 1"}, {"--jobs 2"}, {"--shard 1/3", "--shard 2/3", "--shard 3/3"}}) {
+        SCOPED_TRACE(calls[0]);
+        int made = 0;
+        const auto outputs = [&] {
+            Outputs all;
+            made = 0;
+            for (const std::string& call : calls) {
+                const CommandResult ran =
+                    Run("describe --json --recursive clips --skip-done --out-dir outputs " + call);
+                for (const Json& entry : Json::parse(ran.out)) {
+                    const std::filesystem::path movie = entry["movie"].get<std::string>();
+                    const std::filesystem::path aaf = entry["aaf"].get<std::string>();
+                    EXPECT_TRUE(std::filesystem::exists(folder() / aaf)) << entry;
+                    EXPECT_TRUE(all.emplace(movie.parent_path().filename(), aaf.filename()).second);
+                    made += entry.contains("doneAlready") ? 0 : 1;
+                }
+            }
+            return all;
+        };
+        Copy("clips/b/clip.mov");
+        Copy("clips/c/clip.mov");
+        EXPECT_EQ(outputs(), (Outputs{{"b", "clip.aaf"}, {"c", "clip-2.aaf"}}));
+        EXPECT_EQ(made, 2);
+        Copy("clips/a/clip.mov");
+        const Outputs three{{"a", "clip-3.aaf"}, {"b", "clip.aaf"}, {"c", "clip-2.aaf"}};
+        EXPECT_EQ(outputs(), three) << "one before the others";
+        EXPECT_EQ(made, 1);
+        std::ofstream(folder() / "clips/c/clip.mov", std::ios::app) << "free";
+        std::ofstream(folder() / "clips/a/clip.mov", std::ios::app) << "free";
+        EXPECT_EQ(outputs(), three) << "two that changed";
+        EXPECT_EQ(made, 2);
+        std::filesystem::remove_all(folder() / "clips/b");
+        Copy("clips/d/clip.mov");
+        EXPECT_EQ(outputs(),
+                  (Outputs{{"a", "clip-3.aaf"}, {"c", "clip-2.aaf"}, {"d", "clip-4.aaf"}}))
+            << "the output of one that went is there";
+        EXPECT_EQ(made, 1);
+        std::filesystem::remove(folder() / "outputs/clip.aaf");
+        Copy("clips/e/clip.mov");
+        const Outputs last{
+            {"a", "clip-3.aaf"}, {"c", "clip-2.aaf"}, {"d", "clip-4.aaf"}, {"e", "clip.aaf"}};
+        EXPECT_EQ(outputs(), last) << "it was taken away";
+        EXPECT_EQ(outputs(), last);
+        EXPECT_EQ(made, 0);
+        EXPECT_EQ(NamesIn(folder() / "outputs"),
+                  (Names{kRecords, "clip.aaf", "clip-2.aaf", "clip-3.aaf", "clip-4.aaf"}));
+        std::filesystem::remove_all(folder() / "clips");
+        std::filesystem::remove_all(folder() / "outputs");
+    }
+}
+
+// A part of the movies, other options, and a movie that is given twice.
+TEST_F(SkipDone, KnowsOutputsInOtherCalls) {
+    Counts();
+    const std::string call = "describe --json --skip-done --out-dir out ";
+    const auto aafOf = [&](const std::string& arguments, std::size_t place = 0) {
+        return Json::parse(Run(call + arguments).out).at(place)["aaf"];
+    };
+    EXPECT_EQ(aafOf("in/sub/a.mov"), "out/a-2.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov --use-alpha"), "out/a-2.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov in/sub/a.mov", 1), "out/a-3.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov in/sub/a.mov"), "out/a-2.aaf");
+    EXPECT_EQ(aafOf("in/sub/a.mov in/sub/a.mov", 1), "out/a-3.aaf");
 }
 
 TEST_F(SkipDone, MakesAnewWithOtherOptions) {

@@ -4,9 +4,11 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/MoviePlan.h"
 #include "tests/unit/cliphost/TestFolder.h"
 
 using namespace cliphost;
@@ -86,6 +88,60 @@ TEST_F(DoneMoviesTest, HaveTheOutputOfTheLastRunAlone) {
     EXPECT_FALSE(Has("a.mov", "a.aaf", kState, "1"));
     EXPECT_FALSE(Has("a.mov", "a.aaf", kState, "2"));
     EXPECT_TRUE(Has("a.mov", "a.aaf", kState, "3"));
+}
+
+TEST_F(DoneMoviesTest, TellTheOutputsThatAMovieWasTheLastToHave) {
+    using Outputs = std::vector<std::filesystem::path>;
+    const auto outputsOf = [&](const std::string& movie) {
+        DoneMovies done(folder_.path(), "s");
+        done.Load();
+        Outputs outputs = done.OutputsOf(movie);
+        std::sort(outputs.begin(), outputs.end());
+        return outputs;
+    };
+    const auto run = [&](const std::string& movie, const std::string& output, int date) {
+        WriteFile(folder_ / output, movie);
+        std::filesystem::last_write_time(
+            folder_ / output, std::filesystem::file_time_type(std::chrono::seconds(date)));
+        DoneMovies(folder_.path(), "other").Add(movie, kState, output, DoneMovies::Known::ByDate);
+    };
+    EXPECT_EQ(outputsOf("b/c.mov"), Outputs{});
+    run("b/c.mov", "c.aaf", 1);
+    run("b/c.mov", "c\xFF 2.aaf", 1);
+    EXPECT_EQ(outputsOf("b/../b/c.mov"), (Outputs{"c.aaf", "c\xFF 2.aaf"}));
+    // Whichever file of the record is read first.
+    for (int i = 2; i < 10; ++i) {
+        run(i % 2 == 0 ? "a/c.mov" : "b/c.mov", "c.aaf", i);
+    }
+    EXPECT_EQ(outputsOf("a/c.mov"), Outputs{});
+    run("a/c.mov", "c.aaf", 10);
+    EXPECT_EQ(outputsOf("a/c.mov"), Outputs{"c.aaf"});
+    EXPECT_EQ(outputsOf("b/c.mov"), Outputs{"c\xFF 2.aaf"});
+}
+
+TEST_F(DoneMoviesTest, KeepTheOutputsThatAreThere) {
+    Run("a.mov", "a b.aaf", "A", "other");
+    WriteFile(folder_ / "b.aaf", "B");
+    DoneMovies done(folder_.path(), "s");
+    done.Load();
+    EXPECT_TRUE(done.Keeps("a b.aaf"));
+    EXPECT_FALSE(done.Keeps("b.aaf")) << "no run made it";
+    std::filesystem::remove(folder_ / "a b.aaf");
+    EXPECT_FALSE(done.Keeps("a b.aaf"));
+}
+
+TEST(OutputNumber, IsReadFromANameThatItMakes) {
+    for (const unsigned number : {1U, 2U, 10U, 4294967295U}) {
+        EXPECT_EQ(NumberInName(OutputName("x/clip.mov", number, ".aaf"), "clip.mov", ".aaf"),
+                  number);
+    }
+    for (const char* const name :
+         {"", "clip", "clip.png", "clip-0.aaf", "clip-1.aaf", "clip-02.aaf", "clip-.aaf",
+          "clip-4294967296.aaf", "clip--2.aaf", "clip-2-2.aaf", "other.aaf", "clip2.aaf"}) {
+        EXPECT_EQ(NumberInName(name, "clip.mov", ".aaf"), 0U) << name;
+    }
+    EXPECT_EQ(NumberInName("clip-2.aaf", "clip-2.mov", ".aaf"), 1U);
+    EXPECT_EQ(NumberInName("clip-2-2.aaf", "clip-2.mov", ".aaf"), 2U);
 }
 
 TEST_F(DoneMoviesTest, SurviveACopyOfTheFolderWithItsDatesLost) {

@@ -22,7 +22,9 @@ protected:
         app_.add_flag("-v", "Say more; -vv says all");
         app_.add_option("--module", module_, "Another module");
         CLI::App* const show = app_.add_subcommand("show", "Show what's there");
-        show->footer("Example: cliphost show a\\b\n.hidden");
+        show->footer(
+            "Examples:\n  cliphost show x\n\nFields:\n  a\\b\n.hidden\n\nMore.\n\n"
+            "Exit status: 0, shown; 1,\nnot.");
         show->add_option("files", files_, "Files")->required();
         show->add_option("-o,--output", output_, "Where to; - for standard output")
             ->group("Output: places");
@@ -95,6 +97,18 @@ TEST_F(HelpWords, GiveAManualPage) {
     EXPECT_TRUE(Holds(page, ".SH OUTPUT: PLACES\n"));
     EXPECT_TRUE(Holds(page, ".SH SEE ALSO\n.BR cliphost (1)\n"));
     EXPECT_TRUE(Holds(page, "a\\eb\n\\&.hidden\n")) << "no line is a request: " << page;
+}
+
+TEST_F(HelpWords, GiveAManualPageItsUsualSections) {
+    EXPECT_TRUE(Holds(ManPage(Help(), 1),
+                      ".SH EXIT STATUS\n.nf\n0, shown; 1,\nnot.\n.fi\n"
+                      ".SH NOTES\n.nf\nFields:\n  a\\eb\n\\&.hidden\n\nMore.\n.fi\n"
+                      ".SH EXAMPLES\n.nf\n  cliphost show x\n.fi\n.SH SEE ALSO\n"))
+        << ManPage(Help(), 1);
+    EXPECT_TRUE(Holds(ManPage(Help(), 0), ".SH EXIT STATUS\n.nf\n0.\n.fi\n.SH SEE ALSO\n"));
+    std::vector<HelpVerb> help = Help();
+    help[2].footer.clear();
+    EXPECT_FALSE(Holds(ManPage(help, 2), ".nf")) << "it has none of them";
 }
 
 TEST_F(HelpWords, ListTheVerbsOnTheProgramsPage) {

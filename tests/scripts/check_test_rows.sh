@@ -1,0 +1,42 @@
+#!/usr/bin/env bash
+# Copyright (c) 2026 The Cliphost authors
+# SPDX-License-Identifier: MIT
+#
+# check_test_rows.sh TESTROWS CTEST: ctest's rows of a program are those that it lists, and a program
+# that lists none is an error.
+set -euo pipefail
+rows_script=$1 ctest=$2
+folder=$(mktemp -d)
+trap 'rm -rf "$folder"' EXIT
+fail() { printf 'test_rows: %s\n' "$*" >&2; exit 1; }
+cd "$folder"
+
+cat >CTestTestfile.cmake <<CMAKE
+set(name test_some)
+set(program "$folder/test_some")
+set(rows "$folder/test_some_rows.cmake")
+set(apart "Apart")
+set(filter "*")
+set(properties TIMEOUT 5)
+include("$rows_script")
+CMAKE
+program() { # program LINE ...: lists these
+  { printf '#!/bin/sh\n'; [ $# = 0 ] || printf 'echo "%s"\n' "$@"; } >test_some
+  chmod +x test_some
+  rm -f test_some_rows.cmake
+}
+
+program First. '  One' '  Two  # GetParam() = 2' Apart. '  Three'
+listed=$("$ctest" -N)
+for row in test_some.First Apart.Three; do
+  grep -q ": $row\$" <<<"$listed" || fail "no row $row: $listed"
+done
+grep -q '^Total Tests: 2$' <<<"$listed" || fail "other rows: $listed"
+[ "$(echo test_some_rows*)" = test_some_rows.cmake ] || fail "left over: $(echo test_some_rows*)"
+
+program
+if said=$("$ctest" 2>&1); then
+  fail "a program without tests is taken: $said"
+fi
+grep -q 'test_some lists no tests' <<<"$said" || fail "ctest says: $said"
+[ ! -e test_some_rows.cmake ] || fail "rows are kept of a program without tests"
