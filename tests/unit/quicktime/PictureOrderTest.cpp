@@ -49,6 +49,18 @@ TEST(PictureOrder, StartsBeforeTheGroupForItsLeadingPictures) {
     EXPECT_TRUE(order.IsWholeFrom(5, 2));
 }
 
+TEST(PictureOrder, TakesBackWhatWasToldAsSyncAndIsNone) {
+    host::PictureOrder order(
+        {Packet(0, 0, true), Packet(1, 1, true), Packet(2, 2, true), Packet(3, 3, true)});
+    EXPECT_TRUE(order.IsIntraOnly());
+    order.TakeBackSyncs(1, 3);
+    EXPECT_FALSE(order.IsIntraOnly());
+    EXPECT_FALSE(order.Packet(2).isSync);
+    EXPECT_EQ(order.StartFor(1), 0u);
+    EXPECT_EQ(order.StartFor(2), 0u);
+    EXPECT_EQ(order.StartFor(3), 3u);
+}
+
 TEST(PictureOrder, FillsTimesThatTheContainerLeavesOut) {
     const host::PictureOrder order({Packet(0, 1, true), Packet(1, AV_NOPTS_VALUE, false),
                                     Packet(2, 2, false), Packet(3, 3, false), Packet(4, 5, false)});
