@@ -45,8 +45,8 @@ install(FILES "cmake/cliphost-watch@.service" DESTINATION lib/systemd/system)
 install(FILES LICENSE RENAME copyright DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
 install(FILES README.md DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
 install(DIRECTORY docs DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
-install(PROGRAMS scripts/farm/describe.sbatch scripts/farm/describe_ssh.sh
-        DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost/farm)
+install(PROGRAMS scripts/cluster/describe.sbatch scripts/cluster/describe_ssh.sh
+        DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost/cluster)
 
 set(CPACK_PACKAGE_NAME cliphost)
 set(CPACK_PACKAGE_VERSION ${PROJECT_VERSION})

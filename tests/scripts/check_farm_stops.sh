@@ -5,7 +5,7 @@
 # check_farm_stops.sh SLURM_SH: stop_slurm ends what the farm started, within its time, also a daemon that
 # does not end when it is asked and one that was not noted yet; and nothing before anything was started.
 set -euo pipefail
-folder=$(mktemp -d /tmp/farm-stops.XXXXXX)
+folder=$(mktemp -d /tmp/cluster-stops.XXXXXX)
 others=()
 trap 'kill -KILL "${others[@]}" 2>/dev/null || true; rm -rf "$folder"' EXIT
 fail() { printf 'farm_stops: %s\n' "$*" >&2; exit 1; }
@@ -17,7 +17,7 @@ for name in squeue scancel; do
   chmod +x "$folder/bin/$name"
 done
 PATH=$folder/bin:$PATH
-# shellcheck source=scripts/farm/slurm.sh
+# shellcheck source=scripts/cluster/slurm.sh
 . "$1"
 export slurm_patience=1
 is_gone() { ! kill -0 "$1" 2>/dev/null; }

@@ -6,7 +6,7 @@
 # another put back and takes a node out of use; then compares all outputs with those of a single run.
 set -euo pipefail
 here=$(realpath "$(dirname "${BASH_SOURCE[0]}")")
-# shellcheck source=scripts/farm/slurm.sh
+# shellcheck source=scripts/cluster/slurm.sh
 . "$here/slurm.sh"
 build=$(realpath "$1") movies=${2:-2000}
 shares=16 nodes=(farm1 farm2 farm3 farm4)
@@ -27,10 +27,10 @@ trap stop EXIT
 trap 'exit 129' HUP
 trap 'exit 130' INT
 trap 'exit 143' TERM
-rm -rf build/farm
-mkdir -p build/farm/log
-ln -s "$PWD/build/farm" "$short/farm"
-farm=$short/farm
+rm -rf build/cluster
+mkdir -p build/cluster/log
+ln -s "$PWD/build/cluster" "$short/cluster"
+farm=$short/cluster
 cd "$farm"
 
 "$here/make_movies.py" "$movies" movies
