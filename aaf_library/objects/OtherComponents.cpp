@@ -113,32 +113,33 @@ HRESULT OperationGroup::ReadDefinition(OperationDefinition** definition) const {
     return *definition == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : AAFRESULT_SUCCESS;
 }
 
-HRESULT OperationGroup::IsATimeWarp(aafBoolean_t* isTimeWarp) {
-    if (isTimeWarp == nullptr) {
+HRESULT OperationGroup::AskDefinition(bool (*question)(const OperationDefinition&),
+                                      aafBoolean_t* answer) const {
+    if (answer == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
     OperationDefinition* definition = nullptr;
     const HRESULT result = ReadDefinition(&definition);
     if (result >= 0) {
-        *isTimeWarp = definition->IntegerOr(prop::OperationDefinition_IsTimeWarp, kAAFFalse) != 0
-                          ? kAAFTrue
-                          : kAAFFalse;
+        *answer = question(*definition) ? kAAFTrue : kAAFFalse;
     }
     return result;
 }
 
+HRESULT OperationGroup::IsATimeWarp(aafBoolean_t* isTimeWarp) {
+    return AskDefinition(
+        [](const OperationDefinition& definition) {
+            return definition.IntegerOr(prop::OperationDefinition_IsTimeWarp, kAAFFalse) != 0;
+        },
+        isTimeWarp);
+}
+
 HRESULT OperationGroup::IsValidTranOperation(aafBoolean_t* validTransition) {
-    if (validTransition == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    OperationDefinition* definition = nullptr;
-    const HRESULT result = ReadDefinition(&definition);
-    if (result >= 0) {
-        *validTransition = definition->IntegerOr(prop::OperationDefinition_NumberInputs, 0) == 2
-                               ? kAAFTrue
-                               : kAAFFalse;
-    }
-    return result;
+    return AskDefinition(
+        [](const OperationDefinition& definition) {
+            return definition.IntegerOr(prop::OperationDefinition_NumberInputs, 0) == 2;
+        },
+        validTransition);
 }
 
 // Parameters

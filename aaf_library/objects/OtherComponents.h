@@ -93,6 +93,7 @@ public:
 
 private:
     HRESULT ReadDefinition(OperationDefinition** definition) const;
+    HRESULT AskDefinition(bool (*question)(const OperationDefinition&), aafBoolean_t* answer) const;
 };
 
 // A value of an effect. The dictionary's definition with its id tells the type.

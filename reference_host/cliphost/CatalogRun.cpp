@@ -71,14 +71,9 @@ void TakeThumbnail(Session& session, const std::filesystem::path& movie, catalog
 
 MovieAnswer CatalogAnswer(Session& session, CodecReader& codecs, const CatalogForm& form,
                           const Description& description) {
-    MovieAnswer answer;
-    answer.problem = description.file ? description.doubt : description.problem;
+    MovieAnswer answer = StartAnswer(session, description);
     if (!description.file) {
-        answer.status = StatusOf(description.problem);
         return answer;
-    }
-    if (description.doubt) {
-        TellProblem(description.doubt, session.verbosity());
     }
     TellRoute(description.movie, session.verbosity());
     catalog::Entry entry = EntryOf(description, codecs);

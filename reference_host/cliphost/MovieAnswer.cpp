@@ -41,16 +41,22 @@ bool IsRoute(const std::string& text) {
 
 }  // namespace
 
-MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
-                     const PlaceOfFile& place) {
+MovieAnswer StartAnswer(const Session& session, const Description& description) {
     MovieAnswer answer;
     answer.problem = description.file ? description.doubt : description.problem;
     if (!description.file) {
         answer.status = StatusOf(description.problem);
-        return answer;
-    }
-    if (description.doubt) {
+    } else if (description.doubt) {
         TellProblem(description.doubt, session.verbosity());
+    }
+    return answer;
+}
+
+MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
+                     const PlaceOfFile& place) {
+    MovieAnswer answer = StartAnswer(session, description);
+    if (!description.file) {
+        return answer;
     }
     if (form.columns) {
         WriteColumns(session, description, *form.columns);

@@ -42,6 +42,10 @@ struct MovieAnswer {
 // Failure where that is the movie itself.
 using PlaceOfFile = std::function<std::filesystem::path()>;
 
+// What every answer to a description begins with: its problem, and the status where there is none.
+// Tells a doubt on standard error.
+MovieAnswer StartAnswer(const Session& session, const Description& description);
+
 // Tells on standard error what is told of a movie that is described, maps its locators, saves the
 // description where `place` says, which may be nowhere, and reads it.
 MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
