@@ -56,7 +56,7 @@ PictureReader::PictureReader(std::filesystem::path path, InputOwner input, Codec
       codec_(std::move(codec)),
       stream_(stream),
       order_(std::move(order)),
-      syncClaims_(SyncClaims::Doubted(path_, stream_, Form(), order_)),
+      syncClaims_(SyncClaims::Doubted(path_, *input_->streams[stream_], order_)),
       isSeekable_(TellsTimesOfAll(*input_)),
       marksCutPackets_(IsMovieFamily(*input_)),
       cache_(kMostCachedBytes),

@@ -39,6 +39,8 @@ public:
     ncfUInt64 DecodedPackets() const { return decodedPackets_; }
     // How many were read on the way to where decoding could begin.
     ncfUInt64 PacketsPassed() const { return packetsPassed_; }
+    // How many were read to find out where that is.
+    ncfUInt64 PacketsLookedAt() const { return syncClaims_ ? syncClaims_->PacketsRead() : 0; }
 
 private:
     PictureReader(std::filesystem::path path, InputOwner input, CodecOwner codec, int stream,

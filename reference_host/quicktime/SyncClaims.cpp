@@ -10,25 +10,20 @@
 
 namespace host {
 
-std::unique_ptr<SyncClaims> SyncClaims::Doubted(const std::filesystem::path& path, int stream,
-                                                const AVCodecParameters& form,
-                                                const PictureOrder& order) {
-    if (!order.IsIntraOnly() || order.PacketCount() < 2 || IsCodedAlone(form)) {
+std::unique_ptr<SyncClaims> SyncClaims::Doubted(const std::filesystem::path& path,
+                                                const AVStream& stream, const PictureOrder& order) {
+    if (!order.IsIntraOnly() || order.PacketCount() < 2 || IsCodedAlone(*stream.codecpar)) {
         return nullptr;
     }
-    InputOwner input = OpenForPictures(path, stream);
-    std::unique_ptr<SyncTeller> teller = input ? SyncTeller::Of(*input->streams[stream]) : nullptr;
-    if (!teller) {
-        return nullptr;
-    }
-    UseOneStream(*input, stream);
-    return std::unique_ptr<SyncClaims>(
-        new SyncClaims(std::move(input), stream, std::move(teller), order.PacketCount()));
+    std::unique_ptr<SyncTeller> teller = SyncTeller::Of(stream);
+    return teller ? std::unique_ptr<SyncClaims>(
+                        new SyncClaims(path, stream.index, std::move(teller), order.PacketCount()))
+                  : nullptr;
 }
 
-SyncClaims::SyncClaims(InputOwner input, int stream, std::unique_ptr<SyncTeller> teller,
+SyncClaims::SyncClaims(std::filesystem::path path, int stream, std::unique_ptr<SyncTeller> teller,
                        std::size_t packets)
-    : input_(std::move(input)),
+    : path_(std::move(path)),
       stream_(stream),
       teller_(std::move(teller)),
       packet_(av_packet_alloc()),
@@ -40,8 +35,15 @@ void SyncClaims::Check(PictureOrder& order, std::size_t picture) {
     const std::size_t claimed = order.StartFor(picture);
     std::size_t packet = claimed;
     while (!isTrue_[packet]) {
-        isTrue_[packet] = StandsAlone(order.Packet(packet));
-        packet -= isTrue_[packet] ? 0 : 1;
+        if (!order.Packet(packet).isSync) {
+            // As was found out before.
+            const auto known = order.PictureOfPacket(packet);
+            packet = known ? order.StartFor(*known) : packet - 1;
+        } else if (StandsAlone(order.Packet(packet))) {
+            isTrue_[packet] = true;
+        } else {
+            --packet;
+        }
     }
     if (packet != claimed) {
         order.TakeBackSyncs(packet + 1, claimed + 1);
@@ -49,8 +51,15 @@ void SyncClaims::Check(PictureOrder& order, std::size_t picture) {
 }
 
 bool SyncClaims::StandsAlone(const PacketEntry& entry) {
-    const bool isThere = packet_ && ReadPacketOf(*input_, stream_, entry, 0, *packet_);
+    if (!input_) {
+        input_ = OpenForPictures(path_, stream_);
+        if (input_) {
+            UseOneStream(*input_, stream_);
+        }
+    }
+    const bool isThere = input_ && packet_ && ReadPacketOf(*input_, stream_, entry, 0, *packet_);
     const bool standsAlone = isThere && teller_->StandsAlone(*packet_);
+    packetsRead_ += isThere;
     if (packet_) {
         av_packet_unref(packet_.get());
     }

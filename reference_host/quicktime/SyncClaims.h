@@ -17,23 +17,27 @@ namespace host {
 class SyncClaims {
 public:
     // Null where nothing is in doubt.
-    static std::unique_ptr<SyncClaims> Doubted(const std::filesystem::path& path, int stream,
-                                               const AVCodecParameters& form,
-                                               const PictureOrder& order);
+    static std::unique_ptr<SyncClaims> Doubted(const std::filesystem::path& path,
+                                               const AVStream& stream, const PictureOrder& order);
 
     // Behind it, StartFor(picture) is true.
     void Check(PictureOrder& order, std::size_t picture);
 
+    // How many samples were read for it so far.
+    ncfUInt64 PacketsRead() const { return packetsRead_; }
+
 private:
-    SyncClaims(InputOwner input, int stream, std::unique_ptr<SyncTeller> teller,
+    SyncClaims(std::filesystem::path path, int stream, std::unique_ptr<SyncTeller> teller,
                std::size_t packets);
     bool StandsAlone(const PacketEntry& entry);
 
-    InputOwner input_;
+    std::filesystem::path path_;
     int stream_;
     std::unique_ptr<SyncTeller> teller_;
+    InputOwner input_;  // opened when something is first looked at
     PacketOwner packet_;
     std::vector<bool> isTrue_;  // for each packet
+    ncfUInt64 packetsRead_ = 0;
 };
 
 }  // namespace host

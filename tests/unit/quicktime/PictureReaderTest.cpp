@@ -213,6 +213,22 @@ TEST(PacketList, KnowsTheSyncSamplesOfReorderedPicturesByContent) {
     }
 }
 
+TEST(PictureReader, LooksAtEachSampleOnceForTheClaim) {
+    const MadeMovie movie(
+        "-f lavfi -i testsrc2=s=64x48:r=25:d=12 -c:v libx264 -bf 0 -g 300 -sc_threshold 0 "
+        "-pix_fmt yuv420p -threads 1");
+    const MadeMovie claiming = ClaimingAllSync(movie);
+    const auto reader = Open(claiming);
+    ASSERT_TRUE(reader);
+    std::shared_ptr<const AVFrame> frame;
+    ASSERT_EQ(reader->Read(0, frame), NCF_OK);
+    EXPECT_EQ(reader->PacketsLookedAt(), 0u);
+    for (const std::size_t i : {290u, 30u, 270u, 150u, 280u, 20u, 299u, 10u}) {
+        ASSERT_EQ(reader->Read(i, frame), NCF_OK) << i;
+        EXPECT_LE(reader->PacketsLookedAt(), 299u);
+    }
+}
+
 TEST(PictureReader, BelievesTheClaimWhereItIsTrue) {
     for (const char* const codec :
          {"libx264 -pix_fmt yuv420p -tune zerolatency -threads 1", "mpeg2video -threads 1", "qtrle",
