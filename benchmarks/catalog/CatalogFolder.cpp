@@ -17,7 +17,7 @@
 #include "benchmarks/support/Ratios.h"
 #include "reference_host/catalog/Catalog.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 namespace {
 

@@ -22,7 +22,7 @@
 #include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 namespace {
 

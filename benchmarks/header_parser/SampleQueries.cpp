@@ -15,7 +15,7 @@
 #include "benchmarks/support/Ratios.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/util/Ref.h"
-#include "tests/support/movies/TrackAtoms.h"
+#include "reference_host/movie_writer/TrackAtoms.h"
 
 namespace {
 

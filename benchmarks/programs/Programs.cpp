@@ -14,7 +14,7 @@
 
 #include "benchmarks/support/Ratios.h"
 #include "tests/support/Quoted.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 namespace {
 

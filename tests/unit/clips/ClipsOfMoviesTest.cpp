@@ -9,7 +9,7 @@
 #include "reference_host/xml/XmlDocument.h"
 #include "source/clips/LoadMedia.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/unit/clips/ClipFixture.h"
 
 namespace {

@@ -11,7 +11,7 @@
 #include "reference_host/header_parser/QTParser.h"
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/support/fakes/StubSampleMapping.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/unit/components/ComponentFixture.h"
 
 namespace {

@@ -6,7 +6,7 @@
 
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/util/Ref.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 // A movie that went through the parser, asked through its interfaces alone.
 class ParsedMovie {

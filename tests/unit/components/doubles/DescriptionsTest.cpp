@@ -9,7 +9,7 @@
 #include "source/components/QuickTimeContainer.h"
 #include "source/components/QuickTimeMediaVolume.h"
 #include "tests/support/fakes/FakeLock.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/unit/aaf/support/FakeAAF.h"
 #include "tests/unit/components/ComponentFixture.h"
 #include "tests/unit/components/doubles/Doubles.h"
