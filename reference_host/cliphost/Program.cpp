@@ -123,6 +123,7 @@ int Run(int argc, char** argv) {
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);
+    AddValidate(app, session, status);
     AddHelpFiles(app);
     AddSettingsFile(app);
     TellExitStatus(app);

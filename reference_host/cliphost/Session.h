@@ -29,6 +29,9 @@ struct SessionOptions {
 // The AAF library that the command line means, for verbs that need no module. Throws a Failure.
 std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options);
 
+// Registers what a host of clips has besides the framework: parser, wrapper, XML, parameters.
+void RegisterServices(host::Host& host);
+
 // A host with all its services and the module loaded into it.
 class Session {
 public:

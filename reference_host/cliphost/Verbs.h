@@ -24,6 +24,7 @@ void AddVerify(CLI::App& app, const SessionOptions& session, int& status);
 void AddRelink(CLI::App& app, const SessionOptions& session, int& status);
 void AddCatalog(CLI::App& app, const SessionOptions& session, int& status);
 void AddFind(CLI::App& app, int& status);
+void AddValidate(CLI::App& app, const SessionOptions& session, int& status);
 void AddHelpFiles(CLI::App& app);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
 

@@ -76,6 +76,9 @@ SAMPLES = [
         ("find", "--json", "bad/no_aaf.aaf", 2),
         ("types", "--json", ""),
         ("types", "--json", "--plugin absent", 2),
+        ("validate", "--json", "bad/no_aaf.aaf", 1),
+        ("validate", "--json", "--list"),
+        ("validate", "--json", "absent.nvx", 2),
         ("plugin", "--json", ""),
         ("plugin", "--json", "--plugin absent", 2),
     )
