@@ -11,6 +11,13 @@ NCFRESULT Count(DefinitionCalls& calls) {
     return ++calls.all == calls.refused ? NCF_E_OUTOFMEMORY : NCF_OK;
 }
 
+NCFRESULT CountDefine(DefinitionCalls& calls) {
+    ++calls.defines;
+    const NCFRESULT result = Count(calls);
+    calls.wasDefineRefused = calls.wasDefineRefused || result < 0;
+    return result;
+}
+
 class CountingPlugin final : public host::Component<INCFPluginDefinition> {
 public:
     explicit CountingPlugin(DefinitionCalls& calls) : calls_(calls) {}
@@ -19,8 +26,7 @@ public:
     }
     NCFRESULT Define(const GUID&, ncfUInt32, ncfUInt32, const char*, const GUID&, const char*,
                      ncfUInt32, ncfUInt32) override {
-        ++calls_.defines;
-        return Count(calls_);
+        return CountDefine(calls_);
     }
 
 private:
@@ -35,8 +41,7 @@ public:
     }
     NCFRESULT Define(const GUID&, const GUID&, ncfUInt32, ncfUInt32, const GUID&,
                      const char*) override {
-        ++calls_.defines;
-        return Count(calls_);
+        return CountDefine(calls_);
     }
 
 private:

@@ -11,6 +11,7 @@ struct DefinitionCalls {
     int all = 0;      // SetAttribute and Define
     int defines = 0;  // Define alone
     int refused = 0;  // this one of all calls gets NCF_E_OUTOFMEMORY; 0: none
+    bool wasDefineRefused = false;
 };
 
 // Puts definition objects that count in place of the host's; `calls` outlives the host.

@@ -119,8 +119,8 @@ void MobsHaveSlots(Trial& trial) {
 
 void OutlivesTheContainer(Trial& trial) {
     Containers containers(trial);
-    const Described described = DescribeSound(containers, WriteSoundMovie(trial.folder()).file);
-    const host::Ref<IAAFFile> file = described.file;
+    const SampleMovie movie = WriteSoundMovie(trial.folder());
+    const host::Ref<IAAFFile> file = DescribeSound(containers, movie.file).file;
     trial.Doing("reading a description after its container's end");
     trial.Expect(!MobsOf(trial, file.get()).empty(), "its mobs are still there", "there are none");
 }

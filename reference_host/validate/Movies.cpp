@@ -176,15 +176,11 @@ std::vector<SampleMovie> WriteHugeMovies(const std::filesystem::path& folder) {
 
 std::vector<SampleMovie> WriteOddlyNamedMovies(const std::filesystem::path& folder) {
     const std::vector<std::string> names = {
-        "with a blank.mov",
-        "quote\"s and 'more'.mov",
-        "100%s %n.mov",
-        "\xC3\xBC\xE2\x82\xAC\xF0\x9F\x8E\x9E.mov",
-        "line\nend.mov",
-        ".hidden.mov",
-        "UPPER.MOV",
-        "two.dots.mov",
-        std::string(240, 'n') + ".mov",
+        "with a blank.mov",  "quote\"s and 'more'.mov",
+        "100%s %n.mov",      "\xC3\xBC\xE2\x82\xAC\xF0\x9F\x8E\x9E.mov",
+        "line\nend.mov",     ".hidden.mov",
+        "UPPER.MOV",         "two.dots.mov",
+        "no UTF-8 \xFF.mov", std::string(240, 'n') + ".mov",
     };
     std::vector<SampleMovie> written;
     for (const std::string& name : names) {

@@ -1,5 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include <algorithm>
+
 #include "reference_host/system/ProcessFacts.h"
 #include "reference_host/validate/Steps.h"
 
@@ -189,12 +191,18 @@ void CreatedOnThreads(Trial& trial) {
 void NoThreadOfItsOwn(Trial& trial) {
     Module module(trial);
     const std::size_t before = host::system::OwnFacts().threads;
+    std::size_t most = before;
     module.Start();
-    ForEachObject(module, [&](Made&) {
-        const std::size_t now = host::system::OwnFacts().threads;
-        trial.Expect(now <= before, "the module starts no thread",
-                     std::to_string(now - before) + " more than before NCFStartup");
-    });
+    ForEachObject(module, [&](Made&) { most = std::max(most, host::system::OwnFacts().threads); });
+    trial.Doing("counting threads after NCFShutdown");
+    module.Shutdown();
+    const std::size_t after = host::system::OwnFacts().threads;
+    trial.Expect(after <= before, "no thread of the module is left, since its code may go",
+                 std::to_string(after - before) + " more than before NCFStartup");
+    if (most > before) {
+        trial.Warn("the module starts no thread",
+                   std::to_string(most - before) + " more while it ran");
+    }
 }
 
 }  // namespace
@@ -235,7 +243,8 @@ std::vector<Check> OrderChecks() {
         {"order-creation-on-threads",
          "Objects may be made and released on several threads at once.",
          "the counter of objects is not atomic, or creation shares a variable", CreatedOnThreads},
-        {"order-no-thread", "A module starts no thread of its own.",
+        {"order-no-thread",
+         "A module starts no thread of its own; after NCFShutdown none may be left.",
          "NCFStartup or a constructor starts a thread", NoThreadOfItsOwn},
     };
 }

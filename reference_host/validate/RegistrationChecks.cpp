@@ -179,8 +179,11 @@ void DefinesOnce(Trial& trial) {
     host::Ref<INCFPluginDefinition> plugin;
     trial.ExpectSuccess(module.registerPlugin(module.unknown(), plugin.Out()));
     const auto expectOnce = [&] {
-        trial.Expect(calls.defines == 1, "Define is called once for each definition",
-                     std::to_string(calls.defines) + " times");
+        constexpr char kOnce[] = "Define is called once for each definition";
+        trial.Expect(calls.defines > 0, kOnce, "it is not called");
+        if (calls.defines > 1) {
+            trial.Warn(kOnce, std::to_string(calls.defines) + " times");
+        }
         calls.defines = 0;
     };
     expectOnce();

@@ -35,12 +35,14 @@ void Trial::Fail(std::string expected, std::string found, std::string cause) con
     throw Ended{Verdict::kFailed, std::move(expected), std::move(found), std::move(cause)};
 }
 
-void Trial::Warn(std::string expected, std::string found) const {
-    throw Ended{Verdict::kWarning, std::move(expected), std::move(found), {}};
-}
-
 void Trial::Skip(std::string why) const {
     throw Ended{Verdict::kSkipped, {}, std::move(why), {}};
+}
+
+void Trial::Warn(std::string expected, std::string found) {
+    if (!warning_) {
+        warning_ = Outcome{Verdict::kWarning, step_, std::move(expected), std::move(found), {}};
+    }
 }
 
 void Trial::Expect(bool isSo, const char* expected, const std::string& found) const {
@@ -90,6 +92,10 @@ Outcome Run(const Check& check, const TrialOptions& options, const Trial::Tell& 
         thrown("something that is no std::exception");
     }
     outcome.done = trial.step();
+    if (outcome.verdict == Verdict::kPassed && trial.warning()) {
+        outcome = *trial.warning();
+        outcome.cause = check.cause;
+    }
     return outcome;
 }
 

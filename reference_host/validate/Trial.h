@@ -6,6 +6,7 @@
 #include <filesystem>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 
 #include "reference_host/framework/Host.h"
@@ -36,6 +37,7 @@ public:
     const TrialOptions& options() const { return options_; }
     const std::filesystem::path& folder() const { return options_.folder; }
     const std::string& step() const { return step_; }
+    const std::optional<Outcome>& warning() const { return warning_; }
     std::string Text(NCFRESULT result) const { return options_.resultText(result); }
 
     // A new host, with all its services.
@@ -46,8 +48,9 @@ public:
 
     // Each ends the check. Without a cause, that of the check's row is told.
     [[noreturn]] void Fail(std::string expected, std::string found, std::string cause = {}) const;
-    [[noreturn]] void Warn(std::string expected, std::string found) const;
     [[noreturn]] void Skip(std::string why) const;
+    // The check goes on; the first warning is told when nothing fails.
+    void Warn(std::string expected, std::string found);
 
     // The same where something is not so.
     void Expect(bool isSo, const char* expected, const std::string& found) const;
@@ -59,6 +62,7 @@ private:
     const TrialOptions& options_;
     Tell tell_;
     std::string step_;
+    std::optional<Outcome> warning_;
 };
 
 // Does a check in this process. What the module throws is a failure of the check.

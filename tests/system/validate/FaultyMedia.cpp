@@ -235,7 +235,9 @@ public:
     }
 
     NCFRESULT GetCapabilities(ncfUInt32* flags) override {
-        *flags = Is("container-capabilities") ? 0 : 1;
+        if (!Is("container-capabilities")) {
+            *flags = 1;
+        }
         return NCF_OK;
     }
     ncfUInt32 GetFileTypeCount() override { return 1; }
@@ -326,6 +328,7 @@ private:
         const fs::path file = path();
         SufferFrom(file);
         if (Is("container-without-path") && file.empty()) {
+            description_ = NewDescription(file);
             return NCF_OK;
         }
         if (Is("files-that-change") && size_ > SizeOf(file)) {

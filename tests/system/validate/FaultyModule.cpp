@@ -109,7 +109,6 @@ constexpr GUID kShyClass = ncfGuid("22222222-0000-4000-8000-000000000018");
 // What belongs to the module while it runs.
 INCFString* keptString = nullptr;
 INCFLock* keptLock = nullptr;
-INCFUnknown* singleThing = nullptr;
 
 // Wrong before anybody calls anything, or at the very end.
 struct AtTheEdges {
@@ -185,6 +184,7 @@ private:
     }
 
     Maker maker_;
+    int made_ = 0;
 };
 
 // Whether the module's state forbids to make anything, as it should not.
@@ -208,13 +208,8 @@ NCFRESULT ClassFactory::CreateInstance(INCFUnknown* host, INCFUnknown* outer, co
     if (outer != nullptr && iid != IID_INCFUnknown && !Is("create-aggregated-interface")) {
         return NCF_CLASS_E_NOAGGREGATION;
     }
-    if (IsOutOfOrder()) {
+    if (IsOutOfOrder() || (Is("factory-kept") && ++made_ > 1)) {
         return NCF_E_UNEXPECTED;
-    }
-    if (Is("factory-kept") && singleThing != nullptr && iid == IID_INCFUnknown) {
-        singleThing->AddRef();
-        *out = singleThing;
-        return NCF_OK;
     }
     Object* made = nullptr;
     const NCFRESULT result = maker_(host, outer, &made);
@@ -227,10 +222,6 @@ NCFRESULT ClassFactory::CreateInstance(INCFUnknown* host, INCFUnknown* outer, co
     }
     if (answered < 0 && Is("create-unknown-interface")) {
         return answered;
-    }
-    if (Is("factory-kept")) {
-        singleThing = made->root();
-        singleThing->AddRef();
     }
     made->OwnRelease();
     return answered;
@@ -367,8 +358,8 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterPlugin(INCFUnknown* host, INCFPluginDefin
         return NCF_E_OUTOFMEMORY;
     }
     NCFRESULT result = Define(definition);
-    if (result >= 0 && Is("definition-once")) {
-        result = Define(definition);
+    if (Is("definition-once") || Is("refusal-definition-calls")) {
+        result = Is("definition-once") ? Define(definition) : NCF_OK;
     }
     return HandOut(result < 0 ? result : Attribute(definition), definition, out);
 }

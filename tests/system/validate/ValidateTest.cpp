@@ -86,7 +86,7 @@ constexpr Row kRows[] = {
     {"component-types"},
     {"component-names"},
     {"definition-attributes"},
-    {"definition-once"},
+    {"definition-once", "warning"},
     {"registration-twice"},
     {"register-plugin-null"},
     {"register-component-null"},
