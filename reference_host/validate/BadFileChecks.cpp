@@ -58,7 +58,8 @@ void FileShrinks(Trial& trial) {
 }  // namespace
 
 std::vector<Check> BadFileChecks() {
-    constexpr char kTrust[] = "a number of the file is used before it is compared with its size";
+    static constexpr char kTrust[] =
+        "a number of the file is used before it is compared with its size";
     return {
         {"files-broken",
          "Empty, cut and foreign files are refused or described; nothing is left of them.", kTrust,

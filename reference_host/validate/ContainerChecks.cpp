@@ -217,7 +217,7 @@ void QueriesRefusedInDescription(Trial& trial) {
 }  // namespace
 
 std::vector<Check> ContainerChecks() {
-    constexpr char kRefusal[] =
+    static constexpr char kRefusal[] =
         "a result is not looked at, or an output is set although a later step fails";
     return {
         {"container-file-types",

@@ -182,7 +182,7 @@ void ChangedMovies(Trial& trial) {
 }  // namespace
 
 std::vector<Check> EnduranceChecks() {
-    constexpr char kLeak[] = "something that is taken in each round is given back in none";
+    static constexpr char kLeak[] = "something that is taken in each round is given back in none";
     return {
         {"leaks-registration", "Registering 1000 times leaves no memory and no open file behind.",
          kLeak, RegistrationLeavesNothing},

@@ -256,7 +256,7 @@ void InnerDelegates(Trial& trial) {
 }  // namespace
 
 std::vector<Check> FactoryChecks() {
-    constexpr char kOutput[] =
+    static constexpr char kOutput[] =
         "the output is not set to null at the beginning, or the object is not released";
     return {
         {"factory-offered",

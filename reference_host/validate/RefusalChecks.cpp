@@ -153,7 +153,7 @@ void QueriesRefusedInCreation(Trial& trial) {
 }  // namespace
 
 std::vector<Check> RefusalChecks() {
-    constexpr char kLeft[] =
+    static constexpr char kLeft[] =
         "a result is not looked at, or what was taken before the refusal is not given back";
     return {
         {"refusal-plugin-registration",

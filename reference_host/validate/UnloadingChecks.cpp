@@ -105,7 +105,7 @@ void LoadsAndUnloads(Trial& trial) {
 }  // namespace
 
 std::vector<Check> UnloadingChecks() {
-    constexpr char kCounter[] =
+    static constexpr char kCounter[] =
         "the counter of objects is not raised by each constructor and lowered by each destructor";
     return {
         {"unload-null-host", "NCFCanUnloadNow refuses a null host with NCF_E_INVALIDARG.",

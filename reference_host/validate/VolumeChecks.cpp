@@ -167,7 +167,7 @@ void ListOutlivesVolume(Trial& trial) {
 }  // namespace
 
 std::vector<Check> VolumeChecks() {
-    constexpr char kPair[] = "the output is set before the last step has succeeded";
+    static constexpr char kPair[] = "the output is set before the last step has succeeded";
     return {
         {"volume-claims-again", "A volume says the same of a folder each time.",
          "the first answer is kept, or changes something", ClaimsAFolderEachTime},

@@ -184,8 +184,16 @@ constexpr Row kRows[] = {
     {"fuzz-movies", "crashed"},
 };
 
+void PrintTo(const Row& row, std::ostream* out) {
+    *out << row.id;
+}
+
 class Validates : public SystemTest {
 protected:
+    void TearDown() override {
+        unsetenv("CLIPHOST_FAULT");
+        SystemTest::TearDown();
+    }
     std::filesystem::path Text() {
         const std::filesystem::path file = folder() / "text.nvx";
         std::ofstream(file) << "this is no module\n";
@@ -312,7 +320,7 @@ TEST_F(Validates, AndItsLastLineCounts) {
     ExpectSays(ran, 1,
                "2 checks: 1 passed, 1 failed, 0 crashed, 0 timed out, 0 warning, 0 skipped\n");
     ExpectSays(ran, 1, "failed     plugin-names\n");
-    ExpectSays(ran, 1, "found     the vendor is empty\n");
+    ExpectSays(ran, 1, "found     the name is empty\n");
     ExpectSays(ran, 1, "--only plugin-names\n");
 }
 
@@ -351,8 +359,10 @@ TEST_F(Validates, AndDoesItInItsOwnProcessForADebugger) {
 TEST_F(Validates, AndLeavesNoFilesBehind) {
     const std::filesystem::path scratch = folder() / "scratch";
     std::filesystem::create_directory(scratch);
-    setenv("TMPDIR", scratch.c_str(), 1);
-    Validate(kOurs, "--only files-huge --only container-odd-names");
+    const CommandResult ran =
+        RunCommand("TMPDIR=" + Quoted(scratch) + " " + Quoted(ProgramFolder() / "cliphost") +
+                   " validate " + Quoted(kOurs) + " --only files-huge --only container-odd-names");
+    ExpectSays(ran, 0, "2 checks: 2 passed");
     EXPECT_TRUE(std::filesystem::is_empty(scratch));
 }
 
