@@ -9,7 +9,7 @@
 namespace validate {
 namespace {
 
-constexpr int kRounds = 1000;
+constexpr int kLeakRounds = 1000;
 constexpr int kWarmUp = 50;
 
 // Does something 1000 times, and ends the check as failed where each time leaves something. What
@@ -22,7 +22,7 @@ void ExpectNothingLeft(Trial& trial, const std::string& what, const std::functio
     }
     const host::system::ProcessFacts before = host::system::OwnFacts();
     trial.Doing(what + ", 1000 times");
-    for (int i = 0; i < kRounds; ++i) {
+    for (int i = 0; i < kLeakRounds; ++i) {
         round();
     }
     const host::system::ProcessFacts after = host::system::OwnFacts();
@@ -30,9 +30,10 @@ void ExpectNothingLeft(Trial& trial, const std::string& what, const std::functio
                  std::to_string(after.handles - before.handles) + " more than before");
     trial.Expect(after.threads <= before.threads, "no thread is left",
                  std::to_string(after.threads - before.threads) + " more than before");
-    trial.Expect(
-        after.memory < before.memory + kRounds * kLeastBytesOfARound, "all memory is given back",
-        std::to_string((after.memory - before.memory) / kRounds) + " bytes more with each round");
+    trial.Expect(after.memory < before.memory + kLeakRounds * kLeastBytesOfARound,
+                 "all memory is given back",
+                 std::to_string((after.memory - before.memory) / kLeakRounds) +
+                     " bytes more with each round");
 }
 
 void ObjectsLeaveNothing(Trial& trial) {

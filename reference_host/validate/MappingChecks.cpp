@@ -105,7 +105,7 @@ void RefusesOtherSamples(Trial& trial) {
     });
 }
 
-void OutlivesTheContainer(Trial& trial) {
+void MappingOutlivesTheContainer(Trial& trial) {
     Containers containers(trial);
     const auto mapping = MappingOf(containers, WriteSoundMovie(trial.folder()).file);
     trial.Doing("using a mapping after its container's end");
@@ -133,7 +133,7 @@ std::vector<Check> MappingChecks() {
         {"mapping-outlives",
          "A mapping goes on when its container is released, and counts as "
          "alive.",
-         "the mapping points into the container", OutlivesTheContainer},
+         "the mapping points into the container", MappingOutlivesTheContainer},
     };
 }
 

@@ -6,7 +6,7 @@
 namespace validate {
 namespace {
 
-constexpr GUID kUnknownInterface = ncfGuid("0F7D62A4-58C9-4E1B-A36D-7B2C91E4F058");
+constexpr GUID kForeignInterface = ncfGuid("0F7D62A4-58C9-4E1B-A36D-7B2C91E4F058");
 constexpr GUID kUnknownComponent = ncfGuid("E83B5C17-6A04-4D92-9F2E-15A8D7C0B364");
 
 host::Ref<INCFUnknown> Ask(INCFUnknown* object, const GUID& id) {
@@ -116,7 +116,7 @@ void RefusesUnknownInterface(Trial& trial) {
                         " for an interface that nobody has");
             void* out = Garbage();
             trial.ExpectResult(NCF_E_NOINTERFACE,
-                               one.pointer->QueryInterface(kUnknownInterface, &out),
+                               one.pointer->QueryInterface(kForeignInterface, &out),
                                "NCF_E_NOINTERFACE");
             trial.Expect(out == nullptr, "the output is set to null", "it is left as it was");
         }

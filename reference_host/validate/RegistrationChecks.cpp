@@ -88,7 +88,7 @@ void DefinesEachComponent(Trial& trial) {
     }
 }
 
-void RefusesOtherIndexes(Trial& trial) {
+void RefusesIndexesBeyond(Trial& trial) {
     Module module(trial);
     const ncfUInt32 count = module.Plugin().componentCount;
     for (const ncfUInt32 index : {count, count + 1, 0x7FFFFFFFu, 0xFFFFFFFFu}) {
@@ -280,7 +280,7 @@ std::vector<Check> RegistrationChecks() {
          "the count that Define got is greater than the table of components", DefinesEachComponent},
         {"component-index-beyond",
          "NCFRegisterComponent refuses any other index with NCF_E_INVALIDARG.",
-         "the index is not compared, or one too late", RefusesOtherIndexes},
+         "the index is not compared, or one too late", RefusesIndexesBeyond},
         {"component-ids",
          "Each component has a component id of its own, by which callers create it.",
          "a row of the table was copied and its id not changed", ComponentIdsDiffer},
