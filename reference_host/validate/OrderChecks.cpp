@@ -196,7 +196,7 @@ void NoThreadOfItsOwn(Trial& trial) {
     ForEachObject(module, [&](Made&) { most = std::max(most, host::system::OwnFacts().threads); });
     trial.Doing("counting threads after NCFShutdown");
     module.Shutdown();
-    const std::size_t after = host::system::OwnFacts().threads;
+    const std::size_t after = ThreadsLeft(before);
     trial.Expect(after <= before, "no thread of the module is left, since its code may go",
                  std::to_string(after - before) + " more than before NCFStartup");
     if (most > before) {

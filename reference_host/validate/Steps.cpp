@@ -2,10 +2,12 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/validate/Steps.h"
 
+#include <chrono>
 #include <exception>
 #include <thread>
 
 #include "reference_host/framework/QueryRule.h"
+#include "reference_host/system/ProcessFacts.h"
 
 namespace validate {
 
@@ -29,6 +31,16 @@ void OnThreads(unsigned count, const std::function<void(unsigned)>& work) {
             std::rethrow_exception(one);
         }
     }
+}
+
+std::size_t ThreadsLeft(std::size_t before) {
+    constexpr int kTries = 100;
+    std::size_t now = host::system::OwnFacts().threads;
+    for (int i = 0; i < kTries && now > before; ++i) {
+        std::this_thread::sleep_for(std::chrono::milliseconds(10));
+        now = host::system::OwnFacts().threads;
+    }
+    return now;
 }
 
 const char* WordOf(Refused refused) {

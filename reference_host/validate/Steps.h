@@ -14,6 +14,10 @@ namespace validate {
 // caller gets when all have ended.
 void OnThreads(unsigned count, const std::function<void(unsigned number)>& work);
 
+// How many threads the process has, when it had so many before. One that has ended may be counted
+// for a moment longer, so there is a second's patience with those beyond.
+std::size_t ThreadsLeft(std::size_t before);
+
 // What of the host's is refused.
 enum class Refused { kCreations, kQueries };
 const char* WordOf(Refused refused);
