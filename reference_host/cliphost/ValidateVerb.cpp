@@ -4,10 +4,12 @@
 
 #include <algorithm>
 #include <cctype>
+#include <cerrno>
 #include <map>
 #include <memory>
 #include <random>
 #include <string>
+#include <system_error>
 
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/JsonAnswer.h"
@@ -78,8 +80,16 @@ std::string ShellWord(const std::filesystem::path& path) {
 }
 
 std::string LineToRunAgain(const ValidateCall& call, const Check& check) {
-    return fmt::format("cliphost validate {} --only {}{}", ShellWord(call.module), check.id,
-                       check.takesSeed ? fmt::format(" --seed {}", call.seed) : "");
+    std::string line =
+        fmt::format("cliphost validate {} --only {}", ShellWord(call.module), check.id);
+    const auto add = [&](bool isNeeded, const char* option, std::uint64_t value) {
+        line += isNeeded ? fmt::format(" {} {}", option, value) : "";
+    };
+    const WorkerLimits& limits = call.worker.limits;
+    add(check.takesSeed, "--seed", call.seed);
+    add(limits.seconds != kUsualSeconds, "--limit-seconds", limits.seconds);
+    add(limits.mebibytes != kUsualMebibytes, "--limit-memory", limits.mebibytes);
+    return line;
 }
 
 // A verdict as programs read it.
@@ -173,6 +183,13 @@ void PrintList(const std::vector<const Check*>& checks, bool asJson) {
     }
 }
 
+// Who reads what is printed may go away.
+void FlushOutput() {
+    if (std::fflush(stdout) != 0 && errno != EPIPE) {
+        throw std::system_error(errno, std::generic_category(), "standard output");
+    }
+}
+
 void RefuseModulePath(const std::filesystem::path& module) {
     if (module.empty()) {
         throw Failure(kExitCaller, "validate", "no module is given",
@@ -199,7 +216,7 @@ int Validate(ValidateOptions& options, const SessionOptions& session) {
             outcomes.push_back(ToJson(call, check, outcome));
         } else {
             fmt::print("{}", ToText(call, check, outcome));
-            std::fflush(stdout);
+            FlushOutput();
         }
     };
     if (!options.json) {
@@ -218,6 +235,7 @@ int Validate(ValidateOptions& options, const SessionOptions& session) {
     } else {
         fmt::print("{}\n", tally.Line());
     }
+    FlushOutput();
     return tally.HasFault() ? kExitFile : kExitFine;
 }
 
