@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cstdio>
 #include <memory>
 #include <optional>
 
@@ -58,12 +59,20 @@ std::optional<Outcome> OutcomeIn(FieldReader& fields) {
     return outcome;
 }
 
+Failure NoFolder(const std::filesystem::path& parent, const std::error_code& error) {
+    return {kExitCaller, parent, "no folder can be made there: " + error.message(),
+            "name another one in TMPDIR"};
+}
+
 // A folder that is there for one check.
 class CheckFolder {
 public:
     CheckFolder(const std::filesystem::path& parent, std::size_t number)
         : path_(parent / fmt::format("{}", number)) {
-        std::filesystem::create_directory(path_);
+        std::error_code error;
+        if (!std::filesystem::create_directory(path_, error)) {
+            throw NoFolder(parent, error);
+        }
     }
     ~CheckFolder() {
         std::error_code ignored;
@@ -80,9 +89,7 @@ private:
 std::filesystem::path PathOf(const std::optional<host::system::ScratchFolder>& scratch,
                              const std::error_code& error) {
     if (error) {
-        throw Failure(kExitCaller, host::system::TemporaryFolder(),
-                      "no folder can be made there: " + error.message(),
-                      "name another one in TMPDIR");
+        throw NoFolder(host::system::TemporaryFolder(), error);
     }
     return scratch->path();
 }
@@ -118,7 +125,9 @@ public:
         if (!isOpen) {
             Finish();
         } else if (messages_.IsBroken()) {
-            End(Verdict::kCrashed, "an answer", "bytes that are no answer");
+            End(Verdict::kCrashed, "an answer", "bytes that are no answer",
+                "the module writes where it does not belong, in memory or to a descriptor of the "
+                "process");
         } else {
             HoldToLimits();
         }
@@ -144,12 +153,19 @@ private:
 
     void Finish() {
         const host::system::ProcessEnd end = process_.End();
-        if (!hasOutcome_ || end.signal != 0) {
+        // A fault that the check has found explains more than what came after it.
+        const bool isBadEnd = end.signal != 0 || end.status != 0;
+        if (!hasOutcome_ || (isBadEnd && !IsFault(outcome_.verdict))) {
+            const std::string causeOfEnd =
+                hasOutcome_ ? "a global object's destructor uses something that is gone, or memory "
+                              "was damaged before"
+                            : check_.cause;
             outcome_.done = hasOutcome_ ? "ending the process after the check" : outcome_.done;
             End(Verdict::kCrashed, "the module comes back",
                 (end.signal != 0 ? fmt::format("its process was ended by signal {}", end.signal)
                                  : fmt::format("its process ended with status {}", end.status)) +
-                    LastWords());
+                    LastWords(),
+                causeOfEnd);
         }
         isDone_ = true;
     }
@@ -159,19 +175,22 @@ private:
         const auto ran = Clock::now() - since_;
         if (limits.seconds != 0 && ran > std::chrono::seconds(limits.seconds)) {
             End(Verdict::kTimedOut, fmt::format("an answer within {} s", limits.seconds),
-                "it was still at this");
+                "it was still at this",
+                "a loop or a wait does not end; where the machine is merely slow, a larger "
+                "--limit-seconds helps");
         } else if (limits.mebibytes != 0 && process_.PeakMemory() > limits.mebibytes * kMebibyte) {
             End(Verdict::kFailed, fmt::format("no more than {} MiB of memory", limits.mebibytes),
-                "it took more");
+                "it took more",
+                "memory is claimed by a size that stands in a file, or is never given back");
         }
     }
 
-    void End(Verdict verdict, std::string expected, std::string found) {
+    void End(Verdict verdict, std::string expected, std::string found, std::string cause) {
         process_.End();
         outcome_.verdict = verdict;
         outcome_.expected = std::move(expected);
         outcome_.found = std::move(found);
-        outcome_.cause = check_.cause;
+        outcome_.cause = std::move(cause);
         isDone_ = true;
     }
 
@@ -248,7 +267,12 @@ void ValidateHere(const ValidateCall& call, const TakeOutcome& take) {
     for (std::size_t i = 0; i < call.checks.size(); ++i) {
         const CheckFolder folder(parent, i);
         const validate::TrialOptions options = OptionsOf(call, folder.path());
-        take(*call.checks[i], validate::Run(*call.checks[i], options, [](const std::string&) {}));
+        const Check& check = *call.checks[i];
+        take(check, validate::Run(check, options, [&check](const std::string& step) {
+                 // Standard error is not buffered: the last line stays when the module crashes.
+                 const std::string line = fmt::format("{}: {}", check.id, step);
+                 std::fputs((host::text::Printable(line) + "\n").c_str(), stderr);
+             }));
     }
 }
 
