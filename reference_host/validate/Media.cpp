@@ -135,7 +135,7 @@ Volumes::Volumes(Trial& trial) : module_(trial), folder_(trial.folder() / "movie
     trial.Doing("looking for a component that is a volume");
     const auto factory = FactoryOfMedia(module_, NMA::IID_IMediaVolume, "volume");
     volume_ = Make<NMA::IMediaVolume>(module_, factory.get());
-    std::filesystem::create_directory(folder_);
+    MakeFolder(folder_);
     movies_ = WriteSoundMovies(folder_);
     if (!Claims(folder_)) {
         trial.Skip("the module's volume does not claim a folder of *.mov, and others are not made");

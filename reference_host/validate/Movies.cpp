@@ -3,8 +3,10 @@
 #include "reference_host/validate/Movies.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <fstream>
-#include <stdexcept>
+
+#include "reference_host/validate/Trial.h"
 
 namespace validate {
 namespace {
@@ -32,9 +34,15 @@ Movie WholeMovie() {
     return movie;
 }
 
+// Why the system refused to write. Streams tell no reason of their own.
+std::error_code LastError() {
+    return {errno != 0 ? errno : EIO, std::generic_category()};
+}
+
 SampleMovie Write(const Movie& movie, const std::filesystem::path& file, const char* about) {
+    errno = 0;
     if (!movies::Build(movie).WriteTo(file)) {
-        throw std::runtime_error("a sample movie can't be written");
+        throw CannotWrite{file, LastError()};
     }
     return {about, file};
 }
@@ -213,11 +221,28 @@ Bytes Changed(Bytes bytes, std::mt19937_64& numbers) {
 }
 
 void WriteBytes(const Bytes& bytes, const std::filesystem::path& file) {
+    errno = 0;
     std::ofstream stream(file, std::ios::binary | std::ios::trunc);
     stream.write(reinterpret_cast<const char*>(bytes.data()),
                  static_cast<std::streamsize>(bytes.size()));
     if (!stream.flush()) {
-        throw std::runtime_error("a sample file can't be written");
+        throw CannotWrite{file, LastError()};
+    }
+}
+
+void MakeFolder(const std::filesystem::path& folder) {
+    std::error_code error;
+    std::filesystem::create_directory(folder, error);
+    if (error) {
+        throw CannotWrite{folder, error};
+    }
+}
+
+void CutFile(const std::filesystem::path& file, std::uintmax_t size) {
+    std::error_code error;
+    std::filesystem::resize_file(file, size, error);
+    if (error) {
+        throw CannotWrite{file, error};
     }
 }
 

@@ -38,6 +38,9 @@ std::vector<SampleMovie> WriteOddlyNamedMovies(const std::filesystem::path& fold
 // The bytes with a few changes that the numbers choose.
 movies::Bytes Changed(movies::Bytes bytes, std::mt19937_64& numbers);
 
+// All that writes throws CannotWrite where it can't.
 void WriteBytes(const movies::Bytes& bytes, const std::filesystem::path& file);
+void MakeFolder(const std::filesystem::path& folder);
+void CutFile(const std::filesystem::path& file, std::uintmax_t size);
 
 }  // namespace validate

@@ -5,6 +5,8 @@
 #include <exception>
 #include <utility>
 
+#include "reference_host/framework/HostPath.h"
+
 namespace validate {
 namespace {
 
@@ -84,6 +86,12 @@ Outcome Run(const Check& check, const TrialOptions& options, const Trial::Tell& 
         check.run(trial);
     } catch (Ended& ended) {
         end(std::move(ended));
+    } catch (const CannotWrite& failure) {
+        end({Verdict::kSkipped,
+             {},
+             "the checker can't write " + host::DisplayPath(failure.path) + ": " +
+                 failure.error.message() + "; name another folder in TMPDIR",
+             {}});
     } catch (NCFRESULT result) {
         thrown(options.resultText(result));
     } catch (const std::exception& error) {

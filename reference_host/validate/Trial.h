@@ -8,12 +8,19 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <system_error>
 
 #include "reference_host/framework/Host.h"
 #include "reference_host/validate/Check.h"
 #include "reference_host/validate/Outcome.h"
 
 namespace validate {
+
+// The checker's own files could not be written, which is no fault of the module.
+struct CannotWrite {
+    std::filesystem::path path;
+    std::error_code error;
+};
 
 // What all checks of one call share.
 struct TrialOptions {
@@ -65,7 +72,8 @@ private:
     std::optional<Outcome> warning_;
 };
 
-// Does a check in this process. What the module throws is a failure of the check.
+// Does a check in this process. What the module throws is a failure of the check; where the
+// checker can't write its own files, the check is skipped.
 Outcome Run(const Check& check, const TrialOptions& options, const Trial::Tell& tell);
 
 }  // namespace validate
