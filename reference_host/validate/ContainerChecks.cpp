@@ -43,6 +43,22 @@ void TellsCapabilities(Trial& trial) {
     trial.Expect(flags != kUnset, "the output is set", "it is left as it was");
 }
 
+void TakesAPath(Trial& trial) {
+    Containers containers(trial);
+    const SampleMovie movie = WriteSoundMovie(trial.folder());
+    const auto path = host::ModulePath(movie.file);
+    trial.Doing("calling SetFilePath with the path of a movie");
+    trial.ExpectSuccess(containers.New()->SetFilePath(path.get()));
+}
+
+void DescribesAMovie(Trial& trial) {
+    Containers containers(trial);
+    const auto container = containers.Open(WriteSoundMovie(trial.folder()).file);
+    trial.Doing("describing a sound movie with picture, sound and timecode");
+    trial.ExpectSuccess(Describe(trial, container.get()).result,
+                        "a description, since the container claims *.mov");
+}
+
 void TakesOnePath(Trial& trial) {
     Containers containers(trial);
     const SampleMovie movie = WriteSoundMovie(trial.folder());
@@ -176,7 +192,7 @@ void TakesOddNames(Trial& trial) {
     Containers containers(trial);
     DescribeSound(containers, WriteSoundMovie(trial.folder()).file);
     const std::filesystem::path folder = trial.folder() / "odd";
-    std::filesystem::create_directory(folder);
+    MakeFolder(folder);
     for (const SampleMovie& movie : WriteOddlyNamedMovies(folder)) {
         trial.Doing("describing a movie called " + host::DisplayPath(movie.file.filename()));
         trial.ExpectSuccess(Describe(trial, containers.Open(movie.file).get()).result,
@@ -188,9 +204,8 @@ void DescriptionRefused(Trial& trial, Refused refused) {
     Containers containers(trial);
     const SampleMovie movie = WriteSoundMovie(trial.folder());
     DescribeSound(containers, movie.file);
-    host::Host& host = containers.module().host();
     RefuseEach(
-        host, refused,
+        containers.module(), refused,
         [&](int number) {
             trial.Doing(std::string("describing a movie while the host refuses ") +
                         WordOf(refused) + " " + std::to_string(number));
@@ -226,6 +241,10 @@ std::vector<Check> ContainerChecks() {
          "an output is used before it is looked at, or the index is not compared", TellsFileTypes},
         {"container-capabilities", "A container tells its capabilities, before it has a path.",
          "the output is not set, or a path is needed", TellsCapabilities},
+        {"container-takes-path", "A container takes the path of a movie.",
+         "the path is refused in the form that hosts give it", TakesAPath},
+        {"container-describes", "A container that claims *.mov describes a sound movie.",
+         "a part of a common movie is not understood", DescribesAMovie},
         {"container-path-once", "A container takes one path; another gets NMA_E_ALREADYSET.",
          "the path is replaced", TakesOnePath},
         {"container-path-copied", "A container copies its path.",

@@ -13,7 +13,9 @@
 
 namespace validate {
 
-// Volumes and containers of a module. Checks of them are skipped where it has none.
+// Volumes and containers of a module. Checks of them are skipped where it has none, and where one
+// does not do the least: `container-takes-path`, `container-describes` and `volume-claims` fail
+// then.
 
 // The first component that makes objects with an interface, and its factory.
 host::Ref<INCFClassFactory> FactoryOfMedia(Module& module, const GUID& interfaceId,
@@ -61,7 +63,8 @@ struct Described {
 };
 // Ends the check as failed where an output does not fit its result.
 Described Describe(Trial& trial, NMA::IMediaContainer3* container);
-// The same of a file that the module has to describe: the check is skipped where it does not.
+// The same of a file that the module has to describe. The check is skipped where it does not,
+// since `container-describes` fails.
 Described DescribeSound(Containers& containers, const std::filesystem::path& file);
 // The same, whatever the file is: it is described or refused, and nothing is left of it.
 void DescribeAnything(Containers& containers, const SampleMovie& movie);

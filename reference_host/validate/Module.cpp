@@ -7,9 +7,6 @@
 namespace validate {
 namespace {
 
-// No module has as many; a count beyond it is a broken definition.
-constexpr ncfUInt32 kMostComponents = 4096;
-
 template <class Definition, class Facts, class Interface>
 Facts FactsIn(Trial& trial, Interface* handed) {
     // The module may only hand back an object that it had the host make.
@@ -60,11 +57,16 @@ host::PluginFacts Module::Plugin() {
     return FactsOf(trial_, handed.get());
 }
 
-std::vector<host::ComponentFacts> Module::Components() {
+ncfUInt32 Module::ComponentCount() {
     const ncfUInt32 count = Plugin().componentCount;
     if (count > kMostComponents) {
         trial_.Skip("it claims " + std::to_string(count) + " components");
     }
+    return count;
+}
+
+std::vector<host::ComponentFacts> Module::Components() {
+    const ncfUInt32 count = ComponentCount();
     std::vector<host::ComponentFacts> components;
     for (ncfUInt32 index = 0; index < count; ++index) {
         host::Ref<INCFComponentDefinition> handed;

@@ -18,6 +18,9 @@ inline constexpr const char* kExports[] = {"NCFRegisterPlugin",  "NCFRegisterCom
                                            "NCFGetClassFactory", "NCFCanUnloadNow",
                                            "NCFStartup",         "NCFShutdown"};
 
+// No module has as many components; a count beyond it is a broken definition.
+inline constexpr ncfUInt32 kMostComponents = 4096;
+
 // The module in the process, with a host of its own: nothing of it is called but what a check
 // calls. What a check counts on beyond its own question, and does not get, ends it as skipped:
 // another check tells of that.
@@ -42,6 +45,7 @@ public:
 
     // What the module says of itself when it registers.
     host::PluginFacts Plugin();
+    ncfUInt32 ComponentCount();
     std::vector<host::ComponentFacts> Components();
 
     void Start();

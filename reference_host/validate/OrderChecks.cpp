@@ -30,7 +30,7 @@ void StartedBeforeRegistration(Trial& trial) {
     trial.Doing("calling NCFRegisterPlugin after NCFStartup");
     host::Ref<INCFPluginDefinition> handed;
     trial.ExpectSuccess(module.registerPlugin(module.unknown(), handed.Out()));
-    const ncfUInt32 count = FactsOf(trial, handed.get()).componentCount;
+    const ncfUInt32 count = module.ComponentCount();
     for (ncfUInt32 index = 0; index < count; ++index) {
         trial.Doing("calling NCFRegisterComponent after NCFStartup, for component " +
                     std::to_string(index));

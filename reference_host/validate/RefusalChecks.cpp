@@ -22,15 +22,15 @@ void ExpectNoMore(Trial& trial, host::Host& host, std::int64_t before) {
 }
 
 template <class Definition, class Register>
-void RefuseRegistration(Trial& trial, const char* function, const Register& call) {
+void RefuseRegistration(Trial& trial, const std::string& function, const Register& call) {
     Module module(trial);
     const std::int64_t before = module.host().LiveObjects();
     for (const Refused refused : {Refused::kCreations, Refused::kQueries}) {
         RefuseEach(
-            module.host(), refused,
+            module, refused,
             [&](int number) {
-                trial.Doing(std::string("calling ") + function + " while the host refuses " +
-                            WordOf(refused) + " " + std::to_string(number));
+                trial.Doing("calling " + function + " while the host refuses " + WordOf(refused) +
+                            " " + std::to_string(number));
             },
             [&] {
                 host::Ref<Definition> handed;
@@ -40,13 +40,21 @@ void RefuseRegistration(Trial& trial, const char* function, const Register& call
                 ExpectNoMore(trial, module.host(), before);
             });
     }
-    trial.Doing(std::string("calling ") + function + " after the host has refused something");
+    trial.Doing("calling " + function + " after the host has refused something");
     host::Ref<Definition> handed;
     trial.ExpectSuccess(call(module, handed.Out()), "success, as before the refusals");
 }
 
-NCFRESULT FirstComponent(Module& module, INCFComponentDefinition** out) {
-    return module.registerComponent(module.unknown(), 0, out);
+// Calls `visit` for each component with the function that registers it, in words and as a call.
+template <class Visit>
+void ForEachRegistration(Trial& trial, const Visit& visit) {
+    const ncfUInt32 count = Module(trial).ComponentCount();
+    for (ncfUInt32 index = 0; index < count; ++index) {
+        visit("NCFRegisterComponent for component " + std::to_string(index),
+              [index](Module& module, INCFComponentDefinition** out) {
+                  return module.registerComponent(module.unknown(), index, out);
+              });
+    }
 }
 
 NCFRESULT ThePlugin(Module& module, INCFPluginDefinition** out) {
@@ -58,18 +66,20 @@ void PluginRegistrationRefused(Trial& trial) {
 }
 
 void ComponentRegistrationRefused(Trial& trial) {
-    RefuseRegistration<INCFComponentDefinition>(trial, "NCFRegisterComponent", FirstComponent);
+    ForEachRegistration(trial, [&](const std::string& function, const auto& call) {
+        RefuseRegistration<INCFComponentDefinition>(trial, function, call);
+    });
 }
 
 template <class Definition, class Register>
-void RefuseDefinitionCalls(Trial& trial, const char* function, const Register& call) {
+void RefuseDefinitionCalls(Trial& trial, const std::string& function, const Register& call) {
     constexpr int kMostCalls = 1000;
+    DefinitionCalls calls;  // outlives the module's host
     Module module(trial);
-    DefinitionCalls calls;
     RegisterCountingDefinitions(module.host(), calls);
     const std::int64_t before = module.host().LiveObjects();
     for (int number = 1; number <= kMostCalls; ++number) {
-        trial.Doing(std::string("calling ") + function + " with a definition that refuses call " +
+        trial.Doing("calling " + function + " with a definition that refuses call " +
                     std::to_string(number));
         calls = {};
         calls.refused = number;
@@ -88,11 +98,14 @@ void RefuseDefinitionCalls(Trial& trial, const char* function, const Register& c
         handed.Reset();
         ExpectNoMore(trial, module.host(), before);
     }
+    WarnOfCallsLeft(trial, kMostCalls);
 }
 
 void DefinitionsRefuse(Trial& trial) {
     RefuseDefinitionCalls<INCFPluginDefinition>(trial, "NCFRegisterPlugin", ThePlugin);
-    RefuseDefinitionCalls<INCFComponentDefinition>(trial, "NCFRegisterComponent", FirstComponent);
+    ForEachRegistration(trial, [&](const std::string& function, const auto& call) {
+        RefuseDefinitionCalls<INCFComponentDefinition>(trial, function, call);
+    });
 }
 
 void StartRefused(Trial& trial) {
@@ -100,7 +113,7 @@ void StartRefused(Trial& trial) {
     const std::int64_t before = module.host().LiveObjects();
     for (const Refused refused : {Refused::kCreations, Refused::kQueries}) {
         RefuseEach(
-            module.host(), refused,
+            module, refused,
             [&](int number) {
                 trial.Doing(std::string("calling NCFStartup while the host refuses ") +
                             WordOf(refused) + " " + std::to_string(number));
@@ -123,7 +136,7 @@ void CreationRefused(Trial& trial, Refused refused) {
         made.object.Reset();
         const std::int64_t before = module.host().LiveObjects();
         RefuseEach(
-            module.host(), refused,
+            module, refused,
             [&](int number) {
                 trial.Doing("making an object of " + made.name + " while the host refuses " +
                             WordOf(refused) + " " + std::to_string(number));

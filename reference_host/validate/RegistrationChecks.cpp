@@ -34,7 +34,7 @@ void PluginDefinitionIsTheHosts(Trial& trial) {
 
 void ExpectText(Trial& trial, const std::string& what, const std::string& text) {
     trial.Expect(!text.empty(), "a text that is not empty", what + " is empty");
-    trial.Expect(IsUtf8(text), "UTF-8", what + " is none");
+    trial.Expect(IsUtf8(text), "a text in UTF-8", what + " is not UTF-8");
 }
 
 void PluginHasNames(Trial& trial) {
@@ -69,16 +69,16 @@ void VersionsAreTold(Trial& trial) {
 }
 
 void CountsComponents(Trial& trial) {
-    constexpr ncfUInt32 kMost = 4096;
     Module module(trial);
     trial.Doing("reading the number of components from the plug-in's definition");
     const ncfUInt32 count = module.Plugin().componentCount;
-    trial.Expect(count >= 1 && count <= kMost, "from 1 to 4096 components", std::to_string(count));
+    trial.Expect(count >= 1 && count <= kMostComponents, "from 1 to 4096 components",
+                 std::to_string(count));
 }
 
 void DefinesEachComponent(Trial& trial) {
     Module module(trial);
-    const ncfUInt32 count = module.Plugin().componentCount;
+    const ncfUInt32 count = module.ComponentCount();
     for (ncfUInt32 index = 0; index < count; ++index) {
         trial.Doing("calling NCFRegisterComponent with index " + std::to_string(index) + " of " +
                     std::to_string(count));
@@ -171,9 +171,9 @@ void AttributesHaveTheirTypes(Trial& trial) {
 }
 
 void DefinesOnce(Trial& trial) {
+    DefinitionCalls calls;  // outlives the module's host
     Module module(trial);
-    const ncfUInt32 count = module.Plugin().componentCount;
-    DefinitionCalls calls;
+    const ncfUInt32 count = module.ComponentCount();
     RegisterCountingDefinitions(module.host(), calls);
     trial.Doing("calling NCFRegisterPlugin with a definition object that counts");
     host::Ref<INCFPluginDefinition> plugin;

@@ -43,12 +43,18 @@ std::size_t ThreadsLeft(std::size_t before) {
     return now;
 }
 
+void WarnOfCallsLeft(Trial& trial, int refused) {
+    trial.Warn("no more than " + std::to_string(refused) + " calls of the host",
+               "there are more, which were not refused");
+}
+
 const char* WordOf(Refused refused) {
     return refused == Refused::kCreations ? "creation" : "query";
 }
 
-void RefuseEach(host::Host& host, Refused refused, const std::function<void(int)>& prepare,
+void RefuseEach(Module& module, Refused refused, const std::function<void(int)>& prepare,
                 const std::function<void()>& round) {
+    host::Host& host = module.host();
     constexpr int kMostCalls = 5000;
     // Goes back to answering everything, whatever the round does.
     struct Rules {
@@ -78,6 +84,7 @@ void RefuseEach(host::Host& host, Refused refused, const std::function<void(int)
             return;
         }
     }
+    WarnOfCallsLeft(module.trial(), kMostCalls);
 }
 
 host::Ref<INCFClassFactory> FactoryOf(Module& module, const host::ComponentFacts& component) {

@@ -18,13 +18,17 @@ void OnThreads(unsigned count, const std::function<void(unsigned number)>& work)
 // for a moment longer, so there is a second's patience with those beyond.
 std::size_t ThreadsLeft(std::size_t before);
 
+// Warns that no more than so many calls were refused, though there were others.
+void WarnOfCallsLeft(Trial& trial, int refused);
+
 // What of the host's is refused.
 enum class Refused { kCreations, kQueries };
 const char* WordOf(Refused refused);
 
 // Does `round` with the host's first call refused, then the second, until there are no more
-// calls to refuse; the last round is one without a refusal. `prepare` is not refused anything.
-void RefuseEach(host::Host& host, Refused refused, const std::function<void(int number)>& prepare,
+// calls to refuse; the last round is one without a refusal. `prepare` is not refused anything. Of
+// calls without end some are refused, and a warning tells so.
+void RefuseEach(Module& module, Refused refused, const std::function<void(int number)>& prepare,
                 const std::function<void()>& round);
 
 // The class factory of a component; empty where the module has none for it.

@@ -9,6 +9,19 @@
 namespace validate {
 namespace {
 
+void ClaimsAFolder(Trial& trial) {
+    Containers containers(trial);  // a module without them has volumes of something else
+    Module& module = containers.module();
+    trial.Doing("looking for a component that is a volume");
+    const auto factory = FactoryOfMedia(module, NMA::IID_IMediaVolume, "volume");
+    const auto volume = Make<NMA::IMediaVolume>(module, factory.get());
+    WriteSoundMovies(trial.folder());
+    trial.Doing("calling IsMediaVolume with a folder of sound movies");
+    const auto path = host::ModulePath(trial.folder());
+    trial.ExpectResult(1, volume->IsMediaVolume(path.get()),
+                       "1, since the module's container claims *.mov");
+}
+
 void ClaimsAFolderEachTime(Trial& trial) {
     Volumes volumes(trial);
     for (int round = 2; round <= 20; ++round) {
@@ -20,7 +33,7 @@ void ClaimsAFolderEachTime(Trial& trial) {
 void LeavesOtherFolders(Trial& trial) {
     Volumes volumes(trial);
     const std::filesystem::path empty = trial.folder() / "empty";
-    std::filesystem::create_directory(empty);
+    MakeFolder(empty);
     trial.Doing("calling IsMediaVolume with an empty folder");
     trial.Expect(!volumes.Claims(empty), "0", "1");
     trial.Doing("calling IsMediaVolume with a folder that is not there");
@@ -134,7 +147,7 @@ void ContainerIdLeadsToAContainer(Trial& trial) {
 void GoesOnWithBadFiles(Trial& trial) {
     Volumes volumes(trial);
     const std::filesystem::path folder = trial.folder() / "bad";
-    std::filesystem::create_directory(folder);
+    MakeFolder(folder);
     WriteBrokenMovies(folder);
     WriteHostileMovies(folder);
     trial.Doing("listing a folder of broken and hostile files");
@@ -169,6 +182,9 @@ void ListOutlivesVolume(Trial& trial) {
 std::vector<Check> VolumeChecks() {
     static constexpr char kPair[] = "the output is set before the last step has succeeded";
     return {
+        {"volume-claims", "A volume claims a folder of movies that the module's container claims.",
+         "the folder's entries are compared in another case, or the path is not understood",
+         ClaimsAFolder},
         {"volume-claims-again", "A volume says the same of a folder each time.",
          "the first answer is kept, or changes something", ClaimsAFolderEachTime},
         {"volume-other-folders",

@@ -67,14 +67,15 @@ public:
 
     void LoseContainer() { isLost_ = true; }
 
-    ncfSInt32 GetNumberOfTracks() override { return Is("mapping-tracks") ? 0 : kTracks; }
+    ncfSInt32 GetNumberOfTracks() override { return Is("mapping-tracks") ? -1 : kTracks; }
     NCFRESULT GetNumberOfChannels(ncfUInt32 track, ncfUInt32* channels) override {
         *channels = Is("mapping-samples") ? 0 : 1;
         return Result(track, 0);
     }
     NCFRESULT GetNumberOfSamples(ncfUInt32 track, ncfUInt64* samples) override {
         *samples = kSamples;
-        return isLost_ ? NCF_E_FAIL : Result(track, 0);
+        const bool isSilent = track == 0 && Is("first-track-without-samples");
+        return isLost_ || isSilent ? NCF_E_FAIL : Result(track, 0);
     }
     NCFRESULT GetSampleStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return NCF_E_NOTIMPL; }
     NCFRESULT GetSampleSize(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* size) override {
@@ -202,6 +203,9 @@ public:
     NCFRESULT SetFilePath(INCFString* path) override {
         if (!path_.empty() && !Is("container-path-once")) {
             return NMA_E_ALREADYSET;
+        }
+        if (Is("container-takes-path")) {
+            return NCF_E_INVALIDARG;
         }
         path_ = PathOf(path);
         if (Is("container-path-copied")) {
@@ -342,7 +346,7 @@ private:
             IsWronglyRefused();
             return NCF_E_FAIL;
         }
-        if (IsWronglyRefused()) {
+        if (IsWronglyRefused() || Is("container-describes")) {
             return NCF_E_FAIL;
         }
         void* factory = nullptr;
@@ -497,7 +501,7 @@ public:
     }
 
     NCFRESULT IsMediaVolume(INCFString* path) override {
-        if (Is("volume-claims-again") && wasAsked_) {
+        if (Is("volume-claims") || (Is("volume-claims-again") && wasAsked_)) {
             return 0;
         }
         wasAsked_ = true;

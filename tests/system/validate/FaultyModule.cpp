@@ -6,9 +6,13 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
+#include <iterator>
 #include <new>
+#include <set>
+#include <sstream>
 #include <string>
 #include <thread>
+#include <vector>
 
 #include "host_interfaces/framework/Lock.h"
 #include "host_interfaces/framework/PluginEntry.h"
@@ -18,11 +22,12 @@
 namespace faulty {
 
 bool Is(std::string_view fault) {
-    static const std::string chosen = [] {
+    static const std::set<std::string, std::less<>> chosen = [] {
         const char* const named = std::getenv("CLIPHOST_FAULT");
-        return std::string(named == nullptr ? "" : named);
+        std::istringstream words(named == nullptr ? "" : named);
+        return std::set<std::string, std::less<>>(std::istream_iterator<std::string>(words), {});
     }();
-    return chosen == fault;
+    return chosen.count(fault) != 0;
 }
 
 void Crash() {
@@ -118,8 +123,11 @@ struct AtTheEdges {
         }
     }
     ~AtTheEdges() {
-        if (Is("file-loads-again")) {
+        if (Is("file-loads-again") || Is("end-crashes")) {
             Crash();
+        }
+        if (Is("end-has-status")) {
+            std::_Exit(3);
         }
     }
 } edges;
@@ -273,6 +281,15 @@ NCFRESULT Attribute(Definition* definition) {
     const ncfUInt32 bytes = Is("definition-attributes") ? 3 : 4;
     const NCFRESULT result =
         definition->SetAttribute(kAttribute, kNCFValueTypeUInt32, &kValue, bytes);
+    if (Is("attributes-without-end")) {
+        static int times = 0;  // one more each time
+        ++times;
+        for (int i = 0; i < times; ++i) {
+            if (definition->SetAttribute(kAttribute, kNCFValueTypeUInt32, &kValue, bytes) < 0) {
+                return NCF_E_OUTOFMEMORY;
+            }
+        }
+    }
     return Is("refusal-definition-calls") ? NCF_OK : result;
 }
 
@@ -379,11 +396,14 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterComponent(INCFUnknown* host, ncfUInt32 in
         return NCF_E_UNEXPECTED;
     }
     auto* const definition = NewDefinition<INCFComponentDefinition>(
-        host, CompID_ComponentDefinition, "refusal-component-registration");
+        host, CompID_ComponentDefinition, index == 1 ? "refusal-component-registration" : "");
     if (definition == nullptr) {
         return NCF_E_OUTOFMEMORY;
     }
-    const NCFRESULT result = Define(definition, index % kCount);
+    NCFRESULT result = Define(definition, index % kCount);
+    if (Is("second-component-goes-on") && index == 1) {
+        result = NCF_OK;
+    }
     return HandOut(result < 0 ? result : Attribute(definition), definition, out);
 }
 
@@ -444,6 +464,9 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFStartup(INCFUnknown* host) {
     }
     if (Is("leaks-start")) {
         Leak();
+    }
+    if (Is("takes-memory")) {
+        static const std::vector<char> taken(std::size_t{100} << 20, 1);
     }
     const NCFRESULT result = Take(host);
     state.isStarted = state.isStarted || result >= 0;

@@ -7,8 +7,8 @@
 
 #include "host_interfaces/framework/ComponentFactory.h"
 
-// Objects of a module that is right in everything but one thing, which the environment names. The
-// names are those of the checks that have to find it.
+// Objects of a module that is right in everything but what the environment names. The names are
+// those of the checks that have to find it, and a few of how the process ends.
 namespace faulty {
 
 // Whether the module is to be wrong in this.

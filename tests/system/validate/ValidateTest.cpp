@@ -41,8 +41,8 @@ struct Answer {
 };
 
 Answer Validate(const std::filesystem::path& module, const std::string& options = "") {
-    const CommandResult ran =
-        RunCliphost("validate " + Quoted(module) + " --seed 1 --json " + options);
+    const CommandResult ran = RunCommand(Quoted(ProgramFolder() / "cliphost") + " validate " +
+                                         Quoted(module) + " --seed 1 --json " + options);
     Answer answer{ran.status, json::parse(ran.out, nullptr, false)};
     EXPECT_FALSE(answer.value.is_discarded()) << ran.out;
     return answer;
@@ -130,6 +130,7 @@ constexpr Row kRows[] = {
     {"shutdown-succeeds"},
     {"shutdown-gives-back"},
     {"unload-and-load-again"},
+    {"volume-claims"},
     {"volume-claims-again"},
     {"volume-other-folders"},
     {"volume-info"},
@@ -142,6 +143,8 @@ constexpr Row kRows[] = {
     {"volume-released-first"},
     {"container-file-types", "crashed"},
     {"container-capabilities"},
+    {"container-takes-path"},
+    {"container-describes"},
     {"container-path-once"},
     {"container-path-copied"},
     {"container-without-path"},
@@ -356,6 +359,85 @@ TEST_F(Validates, AndACrashCostsOneCheckAlone) {
     EXPECT_EQ(answer.Of("plugin-names")["verdict"], "passed");
 }
 
+TEST_F(Validates, AndABadEndAfterAPassIsACrash) {
+    for (const auto& [fault, found] : {std::pair("end-crashes", "ended by signal 11"),
+                                       std::pair("end-has-status", "ended with status 3")}) {
+        setenv("CLIPHOST_FAULT", fault, 1);
+        const Answer answer = Validate(Faulty("FaultyModule"), "--only plugin-names");
+        EXPECT_EQ(answer.status, 1);
+        const json check = answer.Of("plugin-names");
+        EXPECT_EQ(check["verdict"], "crashed");
+        EXPECT_EQ(check["done"], "ending the process after the check");
+        EXPECT_NE(check.value("found", "").find(found), std::string::npos) << check.dump(2);
+    }
+}
+
+TEST_F(Validates, AndABadEndDoesNotHideAFault) {
+    for (const char* const faults : {"plugin-names end-crashes", "plugin-names end-has-status"}) {
+        setenv("CLIPHOST_FAULT", faults, 1);
+        const Answer answer = Validate(Faulty("FaultyModule"), "--only plugin-names");
+        EXPECT_EQ(answer.status, 1);
+        EXPECT_EQ(answer.Of("plugin-names")["verdict"], "failed");
+        EXPECT_EQ(answer.Of("plugin-names")["found"], "the name is empty");
+    }
+}
+
+TEST_F(Validates, EachComponentOfTheModule) {
+    setenv("CLIPHOST_FAULT", "second-component-goes-on", 1);
+    const json check = Validate(Faulty("FaultyModule"), "--only refusal-definition-calls")
+                           .Of("refusal-definition-calls");
+    EXPECT_EQ(check["verdict"], "failed");
+    EXPECT_NE(check.value("done", "").find("component 1 "), std::string::npos) << check.dump(2);
+}
+
+TEST_F(Validates, AndWarnsWhereCallsHaveNoEnd) {
+    setenv("CLIPHOST_FAULT", "attributes-without-end", 1);
+    const Answer answer = Validate(Faulty("FaultyModule"), "--only refusal-definition-calls");
+    EXPECT_EQ(answer.status, 0);
+    const json check = answer.Of("refusal-definition-calls");
+    EXPECT_EQ(check["verdict"], "warning") << check.dump(2);
+    EXPECT_EQ(check["found"], "there are more, which were not refused");
+}
+
+TEST_F(Validates, AndAsksForNoMoreComponentsThanAModuleCanHave) {
+    setenv("CLIPHOST_FAULT", "plugin-component-count", 1);
+    for (const std::string id :
+         {"component-definitions", "definition-once", "order-registration-after-start"}) {
+        const json check = Validate(Faulty("FaultyModule"), "--only " + id).Of(id);
+        EXPECT_EQ(check["verdict"], "skipped") << check.dump(2);
+        EXPECT_EQ(check["found"], "it claims 4294967295 components");
+    }
+}
+
+TEST_F(Validates, AMappingWhoseFirstTrackTellsNoSamples) {
+    setenv("CLIPHOST_FAULT", "first-track-without-samples", 1);
+    EXPECT_EQ(Validate(Faulty("FaultyModule"), "--only mapping-outlives")
+                  .Of("mapping-outlives")["verdict"],
+              "passed");
+    setenv("CLIPHOST_FAULT", "first-track-without-samples mapping-outlives", 1);
+    EXPECT_EQ(Validate(Faulty("FaultyModule"), "--only mapping-outlives")
+                  .Of("mapping-outlives")["verdict"],
+              "failed");
+}
+
+TEST_F(Validates, AndHoldsChecksToTheirMemory) {
+    setenv("CLIPHOST_FAULT", "takes-memory files-hostile", 1);  // hangs until that is seen
+    const json check = Validate(Faulty("FaultyModule"), "--only files-hostile --limit-memory 64")
+                           .Of("files-hostile");
+    EXPECT_EQ(check["verdict"], "failed");
+    EXPECT_EQ(check["expected"], "no more than 64 MiB of memory");
+    EXPECT_NE(check.value("cause", "").find("memory is claimed"), std::string::npos);
+    EXPECT_NE(check.value("again", "").find(" --limit-memory 64"), std::string::npos);
+}
+
+TEST_F(Validates, AndTellsWhyACheckTookTooLong) {
+    setenv("CLIPHOST_FAULT", "files-hostile", 1);
+    const json check = Validate(Faulty("FaultyModule"), "--only files-hostile --limit-seconds 1")
+                           .Of("files-hostile");
+    EXPECT_NE(check.value("cause", "").find("a loop or a wait does not end"), std::string::npos);
+    EXPECT_NE(check.value("again", "").find(" --limit-seconds 1"), std::string::npos);
+}
+
 TEST_F(Validates, AndDoesItInItsOwnProcessForADebugger) {
     const Answer answer =
         Validate(kMinimal, "--in-process --only plugin-id --only create-by-class-id");
@@ -366,6 +448,31 @@ TEST_F(Validates, AndDoesItInItsOwnProcessForADebugger) {
                                               " --in-process --only order-shutdown-twice");
     EXPECT_NE(crashed.status, 0);
     EXPECT_NE(crashed.status, 1) << "the crash ends the program: " << crashed.out;
+    EXPECT_NE(crashed.out.find("order-shutdown-twice: calling NCFShutdown a second time\n"),
+              std::string::npos)
+        << crashed.out;
+}
+
+TEST_F(Validates, AndBlamesNoModuleForFilesThatItCannotWriteItself) {
+    for (const char* const given : {"", " --in-process"}) {
+        SCOPED_TRACE(given);
+        const CommandResult ran = RunCommand(
+            "ulimit -f 2; " + Quoted(ProgramFolder() / "cliphost") + " validate " +
+            Quoted(Faulty("FaultyModule")) +
+            " --only files-broken --only volume-info --only container-path-once" + given);
+        ExpectSays(ran, 0, "3 checks: 0 passed, 0 failed, 0 crashed, 0 timed out, 0 warning, 3");
+        ExpectSays(ran, 0, "because   the checker can't write ");
+        ExpectSays(ran, 0, "whole.mov: File too large; name another folder in TMPDIR\n");
+    }
+}
+
+TEST_F(Validates, AndTellsWhenItsAnswerCannotBeWritten) {
+    const std::string call = Quoted(ProgramFolder() / "cliphost") + " validate " +
+                             Quoted(Faulty("FaultyModule")) + " --only plugin-id";
+    for (const char* const given : {"", " --json", " --in-process", " --list"}) {
+        SCOPED_TRACE(given);
+        ExpectSays(RunCommand(call + given + " 2>&1 >/dev/full"), 2, "standard output");
+    }
 }
 
 TEST_F(Validates, AndLeavesNoFilesBehind) {
