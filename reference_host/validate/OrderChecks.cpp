@@ -65,6 +65,31 @@ void StartedWithoutRegistration(Trial& trial) {
     trial.Expect(isAny, "a class factory for one component at least", "there is none");
 }
 
+void ExpectFactoriesOrNothing(Module& module, const std::vector<host::ComponentFacts>& components,
+                              const std::string& when) {
+    Trial& trial = module.trial();
+    for (std::size_t i = 0; i < components.size(); ++i) {
+        trial.Doing("calling NCFGetClassFactory " + when + ", for " + NameOf(components[i], i));
+        void* made = nullptr;
+        const NCFRESULT result = module.getClassFactory(module.unknown(), components[i].classId,
+                                                        IID_INCFClassFactory, &made);
+        const auto factory =
+            host::Ref<INCFClassFactory>::Adopt(static_cast<INCFClassFactory*>(made));
+        trial.Expect((result >= 0) == static_cast<bool>(factory),
+                     "a class factory with success, or null with a failure",
+                     trial.Text(result) + (factory ? ", and an object" : ", and null"));
+    }
+}
+
+void AskedForFactoriesWhileNotStarted(Trial& trial) {
+    Module module(trial);
+    const auto components = module.Components();
+    ExpectFactoriesOrNothing(module, components, "before NCFStartup");
+    module.Start();
+    module.Shutdown();
+    ExpectFactoriesOrNothing(module, components, "after NCFShutdown");
+}
+
 void MakeObjects(Module& module) {
     ForEachObject(module, [](const Made&) {});
 }
@@ -224,6 +249,10 @@ std::vector<Check> OrderChecks() {
          "A host that remembers what a module registered may skip registration the next time.",
          "a table that NCFGetClassFactory reads is filled in by registration",
          StartedWithoutRegistration},
+        {"order-factory-not-started",
+         "NCFGetClassFactory before NCFStartup and after NCFShutdown gives a class factory or "
+         "refuses.",
+         "it uses something that NCFStartup makes", AskedForFactoriesWhileNotStarted},
         {"order-start-twice", "NCFStartup may come twice and needs one NCFShutdown.",
          "starts are counted, or a second one is refused", StartedTwice},
         {"order-shutdown-twice", "NCFShutdown may come twice.",

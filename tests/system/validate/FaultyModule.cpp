@@ -412,6 +412,9 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFGetClassFactory(INCFUnknown* host, const GUID& cl
     if (host == nullptr || out == nullptr) {
         return Is("factory-null-arguments") ? NCF_E_POINTER : NCF_E_INVALIDARG;
     }
+    if (Is("order-factory-not-started") && TheState().wasShutDown) {
+        Crash();
+    }
     if (!Is("factory-unknown-class")) {
         *out = nullptr;
     }

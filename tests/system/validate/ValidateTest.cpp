@@ -66,6 +66,7 @@ constexpr Row kRows[] = {
     {"order-shutdown-without-start"},
     {"order-registration-after-start"},
     {"order-start-without-registration"},
+    {"order-factory-not-started", "crashed"},
     {"order-start-twice"},
     {"order-shutdown-twice", "crashed"},
     {"order-start-again"},
