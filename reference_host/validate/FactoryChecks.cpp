@@ -253,6 +253,21 @@ void InnerDelegates(Trial& trial) {
     });
 }
 
+void CreatesWithoutHost(Trial& trial) {
+    Module module(trial);
+    module.Start();
+    ForEachObject(module, [&](Made& made) {
+        trial.Doing("calling CreateInstance with null for the host, for " + made.name);
+        void* out = nullptr;
+        const NCFRESULT result =
+            made.factory->CreateInstance(nullptr, nullptr, IID_INCFUnknown, &out);
+        const auto object = host::Ref<INCFUnknown>::Adopt(static_cast<INCFUnknown*>(out));
+        trial.Expect((result >= 0) == static_cast<bool>(object),
+                     "an object with success, or null with a failure",
+                     trial.Text(result) + (object ? ", and an object" : ", and null"));
+    });
+}
+
 }  // namespace
 
 std::vector<Check> FactoryChecks() {
@@ -286,6 +301,8 @@ std::vector<Check> FactoryChecks() {
          "the counter of objects leaves class factories out", FactoryRefusesUnloading},
         {"factory-released-first", "An object goes on when its class factory is released.",
          "the object belongs to its class factory", ObjectOutlivesFactory},
+        {"create-null-host", "CreateInstance with null for the host makes an object or refuses.",
+         "the host is used before it is looked at", CreatesWithoutHost},
         {"create-null-output", "CreateInstance refuses null for its output.",
          "the output is used before it is looked at", CreationRefusesNullOutput},
         {"create-unknown-interface",

@@ -211,6 +211,9 @@ NCFRESULT ClassFactory::CreateInstance(INCFUnknown* host, INCFUnknown* outer, co
     }
     *out = nullptr;
     if (host == nullptr) {
+        if (Is("create-null-host")) {
+            Crash();
+        }
         return NCF_E_INVALIDARG;
     }
     if (outer != nullptr && iid != IID_INCFUnknown && !Is("create-aggregated-interface")) {

@@ -106,6 +106,7 @@ constexpr Row kRows[] = {
     {"factory-kept"},
     {"factory-refuses-unloading"},
     {"factory-released-first"},
+    {"create-null-host", "crashed"},
     {"create-null-output"},
     {"create-unknown-interface"},
     {"create-aggregated-interface"},
