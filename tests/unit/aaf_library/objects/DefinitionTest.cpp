@@ -228,6 +228,59 @@ TEST_F(Definition, OfKLVDataHasAType) {
     EXPECT_EQ(bytes.get(), Get(data, &IAAFKLVDataDefinition::GetKLVDataType).get());
 }
 
+// The class of descriptors that a codec serves may be one that only its file knows.
+TEST_F(Definition, OfACodecIsClonedWithItsClass) {
+    Ptr<IAAFClassDef> own;
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->CreateMetaInstance(AUID_AAFClassDef, IID_IAAFClassDef,
+                                                                 own.OutUnknown()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              own->Initialize(
+                  kTwo, Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor),
+                  L"OwnDescriptor", kAAFTrue));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterClassDef(own));
+    Ptr<IAAFCodecDef> codec = Make<IAAFCodecDef>(AUID_AAFCodecDef);
+    ASSERT_EQ(AAFRESULT_SUCCESS, codec->Initialize(kOne, L"Codec", L""));
+    ASSERT_EQ(AAFRESULT_SUCCESS, codec->SetFileDescriptorClass(own));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterCodecDef(codec));
+    Ptr<IAAFMob> mob = FileMob(1);
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFFileDescriptor>(Get(As<IAAFSourceMob>(mob),
+                                                            &IAAFSourceMob::GetEssenceDescriptor))
+                                     ->SetCodecDef(codec));
+
+    Ptr<IAAFFile> target;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, target.Out()));
+    Ptr<IAAFMob> clone;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              mob->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, target, clone.Out()));
+    Ptr<IAAFDictionary> there = Get(target, &IAAFFile::GetDictionary);
+    Ptr<IAAFCodecDef> found = Get(there, &IAAFDictionary::LookupCodecDef, kOne);
+    EXPECT_EQ(Get(there, &IAAFDictionary::LookupClassDef, kTwo).get(),
+              Get(found, &IAAFCodecDef::GetFileDescriptorClass).get());
+}
+
+// A codec and an operation may have one id: each stands in a set of its own.
+TEST_F(Definition, OfOneKindMayHaveTheIdOfAnother) {
+    Ptr<IAAFOperationDef> effect = Make<IAAFOperationDef>(AUID_AAFOperationDef);
+    ASSERT_EQ(AAFRESULT_SUCCESS, effect->Initialize(kOne, L"Effect", L""));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterOperationDef(effect));
+    Ptr<IAAFParameterDef> parameter = Make<IAAFParameterDef>(AUID_AAFParameterDef);
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              parameter->Initialize(
+                  kOne, L"Parameter", L"",
+                  Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterParameterDef(parameter));
+    ASSERT_EQ(AAFRESULT_SUCCESS, effect->AddParameterDef(parameter));
+    Ptr<IAAFOperationGroup> group = Make<IAAFOperationGroup>(AUID_AAFOperationGroup);
+    ASSERT_EQ(AAFRESULT_SUCCESS, group->Initialize(DataDef(kAAFDataDef_LegacyPicture), 10, effect));
+    AddComposition(group);
+    Ptr<IAAFOperationGroup> read = ReopenedSegment<IAAFOperationGroup>();
+    Ptr<IAAFOperationDef> found = Get(read, &IAAFOperationGroup::GetOperationDefinition);
+    EXPECT_EQ(L"Parameter",
+              TextOf<IAAFDefObject>(
+                  As<IAAFDefObject>(Get(found, &IAAFOperationDef::LookupParameterDef, kOne)).get(),
+                  &IAAFDefObject::GetNameBufLen, &IAAFDefObject::GetName));
+}
+
 class SetOfIds : public SavedFile {};
 
 TEST_F(SetOfIds, OfDescriptiveSchemesIsStoredInOrder) {

@@ -357,4 +357,34 @@ TEST_F(Effect, VaryingValueOfATypeWithoutSizeHasNoLength) {
     EXPECT_EQ(AAFRESULT_BAD_TYPE, value->GetValueBufLen(&size));
 }
 
+// The type that a parameter has may be one that only its file knows.
+TEST_F(Effect, CloneTakesTheTypeOfItsParameterAlong) {
+    Ptr<IAAFTypeDefRename> own;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              dictionary_->CreateMetaInstance(AUID_AAFTypeDefRename, IID_IAAFTypeDefRename,
+                                              own.OutUnknown()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              own->Initialize(kNowhere,
+                              Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational),
+                              L"Loudness"));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterTypeDef(As<IAAFTypeDef>(own)));
+    Ptr<IAAFOperationDef> blend = Registered(kBlend, L"Blend");
+    Ptr<IAAFParameterDef> loudness = ParameterOf(kLevel, kNowhere);
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterParameterDef(loudness));
+    ASSERT_EQ(AAFRESULT_SUCCESS, blend->AddParameterDef(loudness));
+    AddComposition(Group(blend));
+
+    Ptr<IAAFFile> target;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, target.Out()));
+    Ptr<IAAFMob> clone;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              Get(header_, &IAAFHeader::LookupMob, MobId(0xC0))
+                  ->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, target, clone.Out()));
+    Ptr<IAAFDictionary> there = Get(target, &IAAFFile::GetDictionary);
+    Ptr<IAAFParameterDef> found = Get(there, &IAAFDictionary::LookupParameterDef, kLevel);
+    EXPECT_EQ(Get(there, &IAAFDictionary::LookupTypeDef, kNowhere).get(),
+              Get(found, &IAAFParameterDef::GetTypeDefinition).get());
+    EXPECT_EQ(AAFRESULT_SUCCESS, target->Save());
+}
+
 }  // namespace aaf_test
