@@ -170,7 +170,7 @@ public:
     // Not in a dictionary: AAFRESULT_OBJECT_NOT_ATTACHED; id not in this model:
     // AAFRESULT_INVALID_OBJ.
     HRESULT PutWeak(const PropertyKey& key, IUnknown* target);
-    Unknown* WeakTarget(const PropertyKey& key) const;
+    Unknown* WeakTarget(const PropertyKey& key) const { return WeakTargetAt(key, 0); }
     template <class I>
     HRESULT ReadWeak(const PropertyKey& key, I** out) const {
         if (out == nullptr) {
@@ -183,7 +183,8 @@ public:
         return target == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : GiveOut(target, out);
     }
     HRESULT AppendWeak(const PropertyKey& key, IUnknown* target);
-    std::vector<Unknown*> WeakTargets(const PropertyKey& key) const;
+    // That of a reference in a list; null behind the last, and where the model doesn't have it.
+    Unknown* WeakTargetAt(const PropertyKey& key, std::size_t index) const;
 
     // -- IAAFObject
     HRESULT GetGeneration(IAAFIdentification** generation) override;

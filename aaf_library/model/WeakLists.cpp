@@ -33,6 +33,23 @@ HRESULT ReadWeakCount(const Object& object, const PropertyKey& key, aafUInt32* c
     return AAFRESULT_SUCCESS;
 }
 
+aafUInt32 FindWeak(const Object& object, const PropertyKey& key, const GUID& id) {
+    const aafUInt32 count = CountWeak(object, key);
+    aafUInt32 place = 0;
+    while (place < count &&
+           GuidAt(object.FindValue(key)->bytes().data() + place * kGuidSize) != id) {
+        ++place;
+    }
+    return place;
+}
+
+aafUInt32 FindWeak(const Object& object, const PropertyKey& key, IUnknown* target) {
+    GUID id{};
+    Unknown* const known = ImplementationOf(target);
+    return known != nullptr && WeakKeyOf(*known, &id) ? FindWeak(object, key, id)
+                                                      : CountWeak(object, key);
+}
+
 HRESULT InsertWeakAt(Object& object, const PropertyKey& key, aafUInt32 index, IUnknown* target) {
     if (target == nullptr) {
         return AAFRESULT_NULL_PARAM;
@@ -61,11 +78,8 @@ HRESULT RemoveWeak(Object& object, const PropertyKey& key, IUnknown* target) {
     if (target == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const std::vector<Unknown*> targets = object.WeakTargets(key);
-    const auto found = std::find(targets.begin(), targets.end(), ImplementationOf(target));
-    return found == targets.end()
-               ? AAFRESULT_OBJECT_NOT_FOUND
-               : RemoveWeakAt(object, key, static_cast<aafUInt32>(found - targets.begin()));
+    const HRESULT result = RemoveWeakAt(object, key, FindWeak(object, key, target));
+    return result == AAFRESULT_BADINDEX ? AAFRESULT_OBJECT_NOT_FOUND : result;
 }
 
 HRESULT AddWeakToSet(Object& object, const PropertyKey& key, IUnknown* target) {

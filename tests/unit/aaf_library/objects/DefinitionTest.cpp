@@ -214,6 +214,18 @@ TEST_F(Definition, OfACodecForgetsAKind) {
     Ptr<IAAFDataDef> left =
         Get(Get(codec, &IAAFCodecDef::GetEssenceKinds), &IEnumAAFDataDefs::NextOne);
     EXPECT_EQ(sound.get(), left.get());
+    // One of another file that has the same id is the same kind.
+    Ptr<IAAFFile> other;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, other.Out()));
+    Ptr<IAAFDataDef> theirs = Get(Get(other, &IAAFFile::GetDictionary),
+                                  &IAAFDictionary::LookupDataDef, kAAFDataDef_LegacySound);
+    aafBoolean_t isSupported = kAAFFalse;
+    EXPECT_EQ(AAFRESULT_SUCCESS, codec->IsEssenceKindSupported(theirs, &isSupported));
+    EXPECT_EQ(kAAFTrue, isSupported);
+    EXPECT_EQ(AAFRESULT_SUCCESS, codec->RemoveEssenceKind(theirs));
+    EXPECT_EQ(0u, Get(codec, &IAAFCodecDef::CountEssenceKinds));
+    EXPECT_EQ(AAFRESULT_SUCCESS, codec->IsEssenceKindSupported(theirs, &isSupported));
+    EXPECT_EQ(kAAFFalse, isSupported);
 }
 
 TEST_F(Definition, OfKLVDataHasAType) {
