@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 // The operations of a mob that reach other mobs and files.
 #include <functional>
+#include <vector>
 
 #include "aaf_library/model/Model.h"
 #include "aaf_library/objects/Checks.h"
@@ -27,6 +28,33 @@ void ForEachReference(const Object& object, const std::function<void(SourceRefer
             ForEachReference(*part, call);
         }
     }
+}
+
+// Copies the mobs that a mob leads to. Those that are there already are taken as they are, so
+// circles end; a way may be as long as a file has mobs.
+HRESULT CopyReferredTo(const Mob& first, bool withEssence, ContentStorage& target) {
+    const auto* const source = dynamic_cast<const ContentStorage*>(first.owner());
+    std::vector<const Mob*> waiting;
+    if (source != nullptr) {
+        waiting.push_back(&first);
+    }
+    HRESULT result = AAFRESULT_SUCCESS;
+    while (result >= 0 && !waiting.empty()) {
+        const Mob& mob = *waiting.back();
+        waiting.pop_back();
+        ForEachReference(mob, [&](const SourceReference& reference) {
+            aafMobID_t id{};
+            reference.ReadStruct(prop::SourceReference_SourceID, &id);
+            const Mob* const needed = source->FindMob(id);
+            if (needed == nullptr || target.FindMob(id) != nullptr || result < 0) {
+                return;
+            }
+            RefPtr<Mob> copy;
+            result = target.AddCopy(*needed, withEssence, copy);
+            waiting.push_back(needed);
+        });
+    }
+    return result;
 }
 
 }  // namespace
@@ -58,27 +86,11 @@ HRESULT Mob::CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includ
     if (target == nullptr) {
         return AAFRESULT_NOT_OPEN;
     }
+    const bool withEssence = includeMedia == kAAFIncludeMedia;
     RefPtr<Mob> copy;
-    HRESULT result = target->AddCopy(*this, includeMedia == kAAFIncludeMedia, copy);
-    if (result < 0) {
-        return result;
-    }
-    // Mobs that are there already are taken as they are, so circles end.
-    ContentStorage* const source = dynamic_cast<ContentStorage*>(owner());
-    if (resolveDependencies == kAAFFollowDepend && source != nullptr) {
-        ForEachReference(*this, [&](SourceReference& reference) {
-            aafMobID_t id{};
-            reference.GetSourceID(&id);
-            Mob* const needed = source->FindMob(id);
-            if (needed == nullptr || target->FindMob(id) != nullptr || result < 0) {
-                return;
-            }
-            IAAFMob* ignored = nullptr;
-            result = needed->CloneExternal(resolveDependencies, includeMedia, destFile, &ignored);
-            if (ignored != nullptr) {
-                ignored->Release();
-            }
-        });
+    HRESULT result = target->AddCopy(*this, withEssence, copy);
+    if (result >= 0 && resolveDependencies == kAAFFollowDepend) {
+        result = CopyReferredTo(*this, withEssence, *target);
     }
     return result < 0 ? result : GiveOut(copy.get(), destMob);
 }

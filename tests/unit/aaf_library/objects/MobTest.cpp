@@ -409,4 +409,34 @@ TEST_F(Mob, AnswersNotImplementedToAccessOfEssence) {
     EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED, master->CountChannels(1, nullptr, nullptr, &channels));
 }
 
+// However long the way, it takes no more stack.
+TEST_F(Mob, IsClonedWithAllMobsOfALongWay) {
+    constexpr std::uint32_t kMobs = 12000;
+    const auto idOf = [](std::uint32_t number) {
+        aafMobID_t id = MobId(1);
+        id.SMPTELabel[1] = static_cast<aafUInt8>(number >> 8);
+        id.SMPTELabel[2] = static_cast<aafUInt8>(number);
+        return id;
+    };
+    Ptr<IAAFDataDef> picture = DataDef(kAAFDataDef_LegacyPicture);
+    for (std::uint32_t number = 0; number < kMobs; ++number) {
+        Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+        ASSERT_EQ(AAFRESULT_SUCCESS, mob->SetMobID(idOf(number)));
+        // The last one leads back to the first.
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  As<IAAFMasterMob>(mob)->NewPhysSourceRef({25, 1}, 1, picture,
+                                                           {idOf((number + 1) % kMobs), 1, 0}, 10));
+        ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
+    }
+    Ptr<IAAFFile> target;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, target.Out()));
+    Ptr<IAAFMob> clone;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              Get(header_, &IAAFHeader::LookupMob, idOf(0))
+                  ->CloneExternal(kAAFFollowDepend, kAAFNoIncludeMedia, target, clone.Out()));
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, Get(target, &IAAFFile::GetHeader)->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(kMobs, count);
+}
+
 }  // namespace aaf_test
