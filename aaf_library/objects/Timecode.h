@@ -20,6 +20,7 @@ public:
     // AAFRESULT_BADSAMPLEOFFSET.
     HRESULT SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
                               aafFrameOffset_t* offset) override;
+    bool HasTimecode() const override { return true; }
 
 private:
     bool IsInitialized() const { return IsPresent(prop::Timecode_Start); }

@@ -80,6 +80,7 @@ TEST_F(TimecodeOffset, OfASequenceIsThatOfItsStretch) {
     EXPECT_EQ(AAFRESULT_SUCCESS, OffsetOf(segment, 1000, &found));
     EXPECT_EQ(0, found);
     EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, OffsetOf(segment, 3000, &found));
+    EXPECT_EQ(0, found);
     aafPosition_t offset = 0;
     aafTimecode_t timecode{};
     aafRational_t rate{25, 1};
@@ -128,6 +129,40 @@ TEST_F(TimecodeOffset, OfAMobIsThatOfItsFirstTimecode) {
     EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, mob->OffsetToMobTimecode(nullptr, &offset, &timecode));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->OffsetToMobTimecode(nullptr, nullptr, &timecode));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->OffsetToMobTimecode(nullptr, &offset, nullptr));
+}
+
+TEST_F(TimecodeOffset, OfAMobIsFoundBehindAShorterPicture) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFCompositionMob);
+    const auto append = [&](IAAFSequence* sequence, aafSlotID_t id) {
+        Ptr<IAAFTimelineMobSlot> slot;
+        ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(sequence),
+                                                                id, L"", 0, slot.Out()));
+    };
+    Ptr<IAAFSequence> empty = Make<IAAFSequence>(AUID_AAFSequence);
+    ASSERT_EQ(AAFRESULT_SUCCESS, empty->Initialize(DataDef(kAAFDataDef_LegacyPicture)));
+    Ptr<IAAFSequence> picture = Make<IAAFSequence>(AUID_AAFSequence);
+    ASSERT_EQ(AAFRESULT_SUCCESS, picture->Initialize(DataDef(kAAFDataDef_LegacyPicture)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, picture->AppendComponent(As<IAAFComponent>(Clip(10))));
+    append(empty, 1);
+    append(picture, 2);
+    append(TwoStretches(), 3);
+    aafPosition_t offset = 12;
+    aafTimecode_t timecode{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->OffsetToMobTimecode(nullptr, &offset, &timecode));
+    EXPECT_EQ(5002, timecode.startFrame);
+    aafFrameOffset_t found = -1;
+    EXPECT_EQ(AAFRESULT_TIMECODE_NOT_FOUND, FrameAt(As<IAAFSegment>(empty), 0, &found));
+    EXPECT_EQ(AAFRESULT_TIMECODE_NOT_FOUND, FrameAt(As<IAAFSegment>(picture), 12, &found));
+}
+
+// Why a timecode isn't there is told by the timecode, not by what stands behind it.
+TEST_F(TimecodeOffset, OfASequenceIsMissedInItsTimecode) {
+    Ptr<IAAFSequence> sequence = TwoStretches();
+    ASSERT_EQ(AAFRESULT_SUCCESS, sequence->AppendComponent(Filler(10, kAAFDataDef_LegacyTimecode)));
+    aafFrameOffset_t found = -1;
+    EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, OffsetOf(As<IAAFSegment>(sequence), 3000, &found));
+    EXPECT_EQ(AAFRESULT_TIMECODE_NOT_FOUND, FrameAt(As<IAAFSegment>(sequence), 25, &found));
+    EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, FrameAt(As<IAAFSegment>(sequence), 30, &found));
 }
 
 class RecordedTimecode : public SavedFile {
