@@ -24,6 +24,10 @@ Mob* ContentStorage::FindMob(const aafMobID_t& id) const {
     return dynamic_cast<Mob*>(FindInSet(prop::ContentStorage_Mobs, &id, sizeof id));
 }
 
+Object* ContentStorage::FindEssence(const aafMobID_t& fileMob) const {
+    return FindInSet(prop::ContentStorage_EssenceData, &fileMob, sizeof fileMob);
+}
+
 Mob* ContentStorage::MobAt(aafUInt32 index) const {
     return dynamic_cast<Mob*>(ObjectAt(prop::ContentStorage_Mobs, index));
 }
@@ -134,7 +138,7 @@ HRESULT ContentStorage::AddCopy(const Mob& source, bool withEssence, RefPtr<Mob>
     if (result < 0 || !withEssence || from == nullptr) {
         return result;
     }
-    const Object* const essence = from->FindInSet(prop::ContentStorage_EssenceData, &id, sizeof id);
+    const Object* const essence = from->FindEssence(id);
     if (essence == nullptr) {
         return result;
     }
@@ -155,9 +159,8 @@ HRESULT ContentStorage::IsEssenceDataPresent(aafMobID_constref fileMobID, aafFil
     if (result == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const bool present =
-        FindInSet(prop::ContentStorage_EssenceData, &fileMobID, sizeof fileMobID) != nullptr;
-    *result = present && fmt == kAAFEssence ? kAAFTrue : kAAFFalse;
+    const bool present = fmt == kAAFEssence && FindEssence(fileMobID) != nullptr;
+    *result = present ? kAAFTrue : kAAFFalse;
     return AAFRESULT_SUCCESS;
 }
 
@@ -173,8 +176,7 @@ HRESULT ContentStorage::AddEssenceData(IAAFEssenceData* essenceData) {
     if (added == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }
-    const aafMobID_t id = added->mobId();
-    if (FindInSet(prop::ContentStorage_EssenceData, &id, sizeof id) != nullptr) {
+    if (FindEssence(added->mobId()) != nullptr) {
         return AAFRESULT_DUPLICATE_MOBID;
     }
     return AddToSet(prop::ContentStorage_EssenceData, essenceData);
@@ -195,7 +197,7 @@ HRESULT ContentStorage::LookupEssenceData(aafMobID_constref mobID, IAAFEssenceDa
     if (essenceData == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    Object* const found = FindInSet(prop::ContentStorage_EssenceData, &mobID, sizeof mobID);
+    Object* const found = FindEssence(mobID);
     return found == nullptr ? AAFRESULT_ESSENCE_NOT_FOUND : GiveOut(found, essenceData);
 }
 

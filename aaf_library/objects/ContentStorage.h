@@ -19,6 +19,8 @@ public:
     Mob* FindMob(const aafMobID_t& id) const;
     aafUInt32 MobCount() const { return CountObjects(prop::ContentStorage_Mobs); }
     Mob* MobAt(aafUInt32 index) const;
+    // The essence data of a file mob.
+    Object* FindEssence(const aafMobID_t& fileMob) const;
     // Whether there is nothing else in it: no essence and no properties of other kinds.
     bool HoldsMobsAlone() const;
     // Adds a copy of a mob of any file, with its essence if that is wanted.
