@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <functional>
 
+#include "aaf_library/model/PropertyKeys.h"
 #include "tests/unit/aaf_library/objects/SavedFile.h"
 
 // Definitions of plug-ins, codecs and KLV data, and the sets of ids in header and clips.
@@ -416,6 +417,62 @@ TEST_F(SetOfIds, OfDescribedSlotsIsStoredInOrder) {
     EXPECT_EQ(AAFRESULT_SUCCESS, clip->RemoveDescribedSlotID(2));
     EXPECT_EQ(AAFRESULT_SUCCESS, clip->RemoveDescribedSlotID(300));
     EXPECT_EQ(0u, Get(clip, &IAAFDescriptiveClip::CountDescribedSlotIDs));
+}
+
+TEST_F(SetOfIds, OfAMarkersSlotsHasEachOnceAndInOrder) {
+    Ptr<IAAFDescriptiveMarker> marker = Make<IAAFDescriptiveMarker>(AUID_AAFDescriptiveMarker);
+    aafUInt32 slots[] = {300, 2, 300, 7};
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, marker->SetDescribedSlotIDs(4, nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, marker->SetDescribedSlotIDs(4, slots));
+    ASSERT_EQ(3u, Get(marker, &IAAFDescriptiveMarker::GetDescribedSlotIDsSize));
+    aafUInt32 found[3] = {};
+    EXPECT_EQ(AAFRESULT_SMALLBUF, marker->GetDescribedSlotIDs(2, found));
+    EXPECT_EQ(0u, found[0]);
+    EXPECT_EQ(AAFRESULT_SUCCESS, marker->GetDescribedSlotIDs(3, found));
+    EXPECT_EQ((std::vector<aafUInt32>{2, 7, 300}), std::vector<aafUInt32>(found, found + 3));
+}
+
+TEST_F(SetOfIds, OfEssenceContainersNeedsAContent) {
+    Ptr<IAAFObject> header = As<IAAFObject>(header_);
+    Ptr<IAAFPropertyDef> content =
+        Get(Get(header, &IAAFObject::GetDefinition), &IAAFClassDef::LookupPropertyDef,
+            aaf::prop::Header_Content.id);
+    ASSERT_EQ(AAFRESULT_SUCCESS, header->RemoveOptionalProperty(content));
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_FOUND, As<IAAFHeader2>(header_)->UpdateEssenceContainers());
+}
+
+// What the header tells of the content goes where the content goes.
+TEST_F(SetOfIds, GoAlongWithACopyOfTheFile) {
+    const auto fill = [](IAAFHeader* header, const aafUID_t& scheme) {
+        Ptr<IAAFHeader2> filled = As<IAAFHeader2>(header);
+        EXPECT_EQ(AAFRESULT_SUCCESS, filled->AddDescriptiveScheme(scheme));
+        EXPECT_EQ(AAFRESULT_SUCCESS, filled->SetOperationalPattern(kTwo));
+    };
+    Ptr<IAAFMob> mob = FileMob(1);
+    ASSERT_EQ(
+        AAFRESULT_SUCCESS,
+        As<IAAFFileDescriptor>(Get(As<IAAFSourceMob>(mob), &IAAFSourceMob::GetEssenceDescriptor))
+            ->SetContainerFormat(Get(Get(dictionary_, &IAAFDictionary::GetContainerDefs),
+                                     &IEnumAAFContainerDefs::NextOne)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFHeader2>(header_)->UpdateEssenceContainers());
+    fill(header_, kThree);
+    Ptr<IAAFHeader2> written = As<IAAFHeader2>(Reopen());
+    // Into a file that its caller has begun to fill.
+    Ptr<IAAFFile> begun;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, begun.Out()));
+    fill(Get(begun, &IAAFFile::GetHeader), kOne);
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(begun));
+    Ptr<IAAFHeader2> copied = As<IAAFHeader2>(Get(begun, &IAAFFile::GetHeader));
+    for (const Ptr<IAAFHeader2>& header : {written, copied}) {
+        EXPECT_EQ(kTwo, Get(header, &IAAFHeader2::GetOperationalPattern));
+        EXPECT_EQ(1u, Get(header, &IAAFHeader2::CountEssenceContainers));
+        aafBoolean_t present = kAAFFalse;
+        EXPECT_EQ(AAFRESULT_SUCCESS, header->IsDescriptiveSchemePresent(kThree, &present));
+        EXPECT_EQ(kAAFTrue, present);
+    }
+    EXPECT_EQ(1u, Get(written, &IAAFHeader2::CountDescriptiveSchemes));
+    EXPECT_EQ(2u, Get(copied, &IAAFHeader2::CountDescriptiveSchemes));
 }
 
 }  // namespace aaf_test
