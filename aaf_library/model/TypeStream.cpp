@@ -38,7 +38,6 @@ HRESULT TypeStream::SetSize(IAAFPropertyValue* streamPropertyValue, aafInt64 new
         return AAFRESULT_BAD_SIZE;
     }
     value->BytesToChange().resize(static_cast<std::size_t>(newSize));
-    value->SetPosition(std::min<std::uint64_t>(value->position(), value->bytes().size()));
     return AAFRESULT_SUCCESS;
 }
 

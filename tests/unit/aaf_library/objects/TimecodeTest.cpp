@@ -1,7 +1,9 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include <algorithm>
+#include <limits>
 
+#include "aaf_library/model/PropertyKeys.h"
 #include "tests/unit/aaf_library/objects/SavedFile.h"
 
 // Timecode by offset, and timecode as it was recorded.
@@ -305,6 +307,44 @@ TEST_F(RecordedTimecode, ChecksItsArguments) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, stream->GetSource(8, bytes, nullptr));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, stream->GetSourceBufLen(nullptr));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, stream->SetSource(8, nullptr));
+}
+
+// A recording of 25 frames has a flag in the place where one of 30 tells that it drops numbers.
+TEST_F(RecordedTimecode, DropsNumbersOfThirtyFramesOnly) {
+    Ptr<IAAFTimecodeStream> stream = Stream({25, 1});
+    EXPECT_EQ(AAFRESULT_INVALID_TIMECODE, stream->SetPositionTimecode(0, {5000, kAAFTcDrop, 25}));
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetPositionTimecode(0, {5000, kAAFTcNonDrop, 25}));
+    std::vector<int> word = Words(stream);
+    std::vector<aafUInt8> flagged(word.begin(), word.end());
+    flagged[1] |= 0x04;
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetSource(8, flagged.data()));
+    aafTimecode_t found{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, stream->GetPositionTimecode(0, &found));
+    EXPECT_EQ(5000, found.startFrame);
+    EXPECT_EQ(kAAFTcNonDrop, found.drop);
+}
+
+// Whoever reads the stream by its value stands at the end of what is there now.
+TEST_F(RecordedTimecode, MayBecomeShorterWhileItIsRead) {
+    Ptr<IAAFTimecodeStream> stream = Stream({25, 1});
+    aafUInt8 bytes[16] = {};
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetSource(16, bytes));
+    Ptr<IAAFObject> object = As<IAAFObject>(stream);
+    Ptr<IAAFPropertyDef> source =
+        Get(Get(object, &IAAFObject::GetDefinition), &IAAFClassDef::LookupPropertyDef,
+            aaf::prop::TimecodeStream_Source.id);
+    Ptr<IAAFPropertyValue> value = Get(object, &IAAFObject::GetPropertyValue, source);
+    Ptr<IAAFTypeDefStream> type = As<IAAFTypeDefStream>(Get(source, &IAAFPropertyDef::GetTypeDef));
+    ASSERT_EQ(AAFRESULT_SUCCESS, type->SetPosition(value, 16));
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetSource(4, bytes));
+    aafInt64 position = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, type->GetPosition(value, &position));
+    EXPECT_EQ(4, position);
+    aafUInt32 read = 0;
+    EXPECT_EQ(AAFRESULT_END_OF_DATA, type->Read(value, sizeof bytes, bytes, &read));
+    Ptr<IAAFTypeDef> number = Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_UInt32);
+    EXPECT_EQ(AAFRESULT_END_OF_DATA, type->ReadElements(value, number, sizeof bytes, bytes, &read));
+    EXPECT_EQ(0u, read);
 }
 
 }  // namespace aaf_test
