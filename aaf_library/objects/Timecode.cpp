@@ -76,18 +76,17 @@ HRESULT Timecode::Store(const aafTimecode_t& timecode) {
 }
 
 HRESULT Timecode::SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) {
-    if (offset == nullptr) {
+    if (offset == nullptr || timecode == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const HRESULT result = GetTimecode(timecode);
-    if (result < 0) {
+    aafTimecode_t found{};
+    if (const HRESULT result = GetTimecode(&found); result < 0) {
         return result;
     }
-    aafPosition_t sum = 0;
-    if (__builtin_add_overflow(timecode->startFrame, *offset, &sum)) {
+    if (__builtin_add_overflow(found.startFrame, *offset, &found.startFrame)) {
         return AAFRESULT_INVALID_PARAM;
     }
-    timecode->startFrame = sum;
+    *timecode = found;
     return AAFRESULT_SUCCESS;
 }
 

@@ -93,6 +93,15 @@ TEST_F(TimecodeOffset, OfASequenceIsThatOfItsStretch) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, segment->SegmentTCToOffset(&timecode, &rate, nullptr));
 }
 
+TEST_F(TimecodeOffset, TellsNothingWhereItWouldOverflow) {
+    Ptr<IAAFSegment> segment = As<IAAFSegment>(Timecode(1000, 10));
+    aafPosition_t offset = std::numeric_limits<aafPosition_t>::max();
+    aafTimecode_t timecode{77, kAAFTcDrop, 30};
+    EXPECT_EQ(AAFRESULT_INVALID_PARAM, segment->SegmentOffsetToTC(&offset, &timecode));
+    EXPECT_EQ(77, timecode.startFrame);
+    EXPECT_EQ(30, timecode.fps);
+}
+
 TEST_F(TimecodeOffset, IsThereInTimecodeOnly) {
     Ptr<IAAFSegment> clip = As<IAAFSegment>(Clip(10));
     aafFrameOffset_t found = -1;
