@@ -116,8 +116,13 @@ HRESULT Timecode::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* edit
     return AAFRESULT_SUCCESS;
 }
 
+bool Edgecode::IsKnown(aafFilmType_t filmKind, aafEdgeType_t codeFormat) {
+    return IsWithin(filmKind, kAAFFtNull, kAAFFt65MM) &&
+           (IsWithin(codeFormat, kAAFEtNull, kAAFEtEdgenum5) || codeFormat == kAAFEtHeaderSize);
+}
+
 HRESULT Edgecode::Initialize(aafLength_t length, aafEdgecode_t edgecode) {
-    if (!IsWithin(edgecode.filmKind, kAAFFtNull, kAAFFt65MM)) {
+    if (!IsKnown(edgecode.filmKind, edgecode.codeFormat)) {
         return AAFRESULT_INVALID_ENUM_VALUE;
     }
     HRESULT result = SetLength(length);
