@@ -34,9 +34,7 @@ HRESULT DefinitionObject::Initialize(aafUID_constref id, aafCharacter_constptr n
 }
 
 HRESULT ContainerDefinition::SetEssenceIsIdentified(aafBoolean_t essenceIsIdentified) {
-    return IsBoolean(essenceIsIdentified)
-               ? PutInteger(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified)
-               : AAFRESULT_INVALID_ENUM_VALUE;
+    return PutBoolean(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified);
 }
 
 HRESULT CodecDefinition::IsEssenceKindSupported(IAAFDataDef* essenceKind,

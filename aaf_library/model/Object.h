@@ -99,6 +99,9 @@ public:
 
     // -- Plain values.
     HRESULT PutInteger(const PropertyKey& key, aafInt64 value);
+    HRESULT PutBoolean(const PropertyKey& key, aafBoolean_t value) {
+        return IsBoolean(value) ? PutInteger(key, value) : AAFRESULT_INVALID_ENUM_VALUE;
+    }
     template <class Integer>
     HRESULT ReadInteger(const PropertyKey& key, Integer* out) const;
     // The value, or `absent` when it is not there.
@@ -122,6 +125,8 @@ public:
     // Values that carry their type: tagged values and parameters.
     HRESULT PutIndirect(const PropertyKey& key, IAAFTypeDef* type, const void* data,
                         std::size_t bytes);
+    // Another value of the type that is there.
+    HRESULT ReplaceIndirect(const PropertyKey& key, const void* data, std::size_t bytes);
     HRESULT ReadIndirect(const PropertyKey& key, void* data, std::size_t bytes) const;
     HRESULT ReadIndirectSize(const PropertyKey& key, aafUInt32* bytes) const;
     HRESULT ReadIndirectType(const PropertyKey& key, IAAFTypeDef** type) const;

@@ -348,6 +348,57 @@ TEST_F(Effect, VaryingValueChecksItsArguments) {
     EXPECT_EQ(AAFRESULT_SUCCESS, point->SetValue(sizeof half, BytesOf(half)));
 }
 
+TEST_F(Effect, ValueThatIsRefusedStaysAsItWas) {
+    Ptr<IAAFParameterDef> level = RegisteredParameter(kLevel);
+    aafRational_t half{1, 2};
+    Ptr<IAAFConstantValue> constant = Make<IAAFConstantValue>(AUID_AAFConstantValue);
+    EXPECT_EQ(AAFRESULT_ILLEGAL_VALUE, constant->Initialize(level, 3, BytesOf(half)));
+    Ptr<IAAFVaryingValue> varying = Make<IAAFVaryingValue>(AUID_AAFVaryingValue);
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_ATTACHED, varying->Initialize(level, FreeLinear()));
+    for (const Ptr<IAAFParameter>& value :
+         {As<IAAFParameter>(constant), As<IAAFParameter>(varying)}) {
+        Ptr<IAAFParameterDef> none;
+        EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, value->GetParameterDefinition(none.Out()));
+    }
+}
+
+// The list may change while it is gone through, as any other.
+TEST_F(Effect, ListOfDefinitionsIsGoneThroughAsItIs) {
+    Ptr<IAAFOperationDef> blend = Registered(kBlend, L"Blend");
+    for (const aafUID_t& id : {kCut, kWipe}) {
+        ASSERT_EQ(AAFRESULT_SUCCESS, blend->AppendDegradeToOperation(Registered(id, L"Other")));
+    }
+    ASSERT_EQ(AAFRESULT_SUCCESS, blend->AppendDegradeToOperation(blend));
+    using I = IEnumAAFOperationDefs;
+    Ptr<I> all = Get(blend, &IAAFOperationDef::GetDegradeToOperations);
+    const auto next = [](I* from) {
+        return Get(As<IAAFDefObject>(Get(from, &I::NextOne)), &IAAFDefObject::GetAUID);
+    };
+    EXPECT_EQ(kCut, next(all));
+    Ptr<I> second = Get(all, &I::Clone);
+    EXPECT_EQ(kWipe, next(all));
+    EXPECT_EQ(kWipe, next(second));
+    EXPECT_EQ(AAFRESULT_SUCCESS, all->Reset());
+    EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->Skip(4));
+    EXPECT_EQ(AAFRESULT_SUCCESS, all->Skip(2));
+    EXPECT_EQ(kBlend, next(all));
+    // Without the first one the second stands at the end.
+    EXPECT_EQ(AAFRESULT_SUCCESS, blend->RemoveDegradeToOperationAt(0));
+    Ptr<IAAFOperationDef> none;
+    EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, second->NextOne(none.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, blend->AppendDegradeToOperation(blend));
+    EXPECT_EQ(kBlend, next(second));
+    // The last reference may go; the empty list is stored.
+    for (int left = 0; left < 3; ++left) {
+        EXPECT_EQ(AAFRESULT_SUCCESS, blend->RemoveDegradeToOperationAt(0));
+    }
+    EXPECT_EQ(AAFRESULT_BADINDEX, blend->RemoveDegradeToOperationAt(0));
+    AddComposition(Group(blend));
+    Ptr<IAAFOperationGroup> read = ReopenedSegment<IAAFOperationGroup>();
+    EXPECT_EQ(0u, Get(Get(read, &IAAFOperationGroup::GetOperationDefinition),
+                      &IAAFOperationDef::CountDegradeToOperations));
+}
+
 TEST_F(Effect, VaryingValueOfATypeWithoutSizeHasNoLength) {
     Ptr<IAAFVaryingValue> value = Make<IAAFVaryingValue>(AUID_AAFVaryingValue);
     Ptr<IAAFParameterDef> text = ParameterOf(kNowhere, kAAFTypeID_String);
