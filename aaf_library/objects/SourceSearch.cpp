@@ -141,14 +141,6 @@ HRESULT FindClip(aafOperationChoice_t choice, At& at) {
     return IsInside(*at.component, at.position) ? AAFRESULT_SUCCESS : AAFRESULT_TRAVERSAL_NOT_POSS;
 }
 
-aafRational_t RateOf(const MobSlot& slot) {
-    aafRational_t rate{};
-    if (slot.ReadStruct(prop::TimelineMobSlot_EditRate, &rate) < 0) {
-        slot.ReadStruct(prop::EventMobSlot_EditRate, &rate);
-    }
-    return rate;
-}
-
 bool IsOfKind(const Mob& mob, aafMobKind_t kind) {
     if (kind == kAAFPhysicalMob) {
         return dynamic_cast<const SourceMob*>(&mob) != nullptr;
@@ -189,8 +181,8 @@ HRESULT Follow(const ContentStorage& storage, aafOperationChoice_t choice, Sourc
     if (next == nullptr) {
         return AAFRESULT_SLOT_NOT_FOUND;
     }
-    const aafRational_t from = RateOf(*slot);
-    place.editRate = RateOf(*next);
+    const aafRational_t from = slot->editRate();
+    place.editRate = next->editRate();
     const aafPosition_t start = Plus(clip.IntegerOr(prop::SourceClip_StartTime, 0), at.position);
     place.reference = {id, slotId, Rescaled(start, from, place.editRate)};
     place.length = at.length < 0 ? at.length : Rescaled(at.length, from, place.editRate);

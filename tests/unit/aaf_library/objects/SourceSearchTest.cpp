@@ -363,6 +363,21 @@ TEST_F(SourceSearch, MasterSlotMayHoldASequence) {
     EXPECT_EQ(100, Get(As<IAAFComponent>(sequence), &IAAFComponent::GetLength));
 }
 
+TEST_F(SourceSearch, SlotOfAClipHasTheRateOfTheEventsThatItRefersTo) {
+    Ptr<IAAFMob> file = Add(kFile, AUID_AAFCDCIDescriptor);
+    Ptr<IAAFSequence> events = OfPicture<IAAFSequence>(AUID_AAFSequence, 10);
+    Ptr<IAAFEventMobSlot> slot;
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFMob2>(file)->AppendNewEventSlot(
+                                     {30, 1}, As<IAAFSegment>(events), 1, L"E", 0, slot.Out()));
+    Ptr<IAAFMob> master = Add(kMaster);
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              As<IAAFMasterMob>(master)->AddMasterSlot(DataDef(kAAFDataDef_LegacyPicture), 1,
+                                                       As<IAAFSourceMob>(file), 1, L"E"));
+    Ptr<IAAFTimelineMobSlot> made =
+        As<IAAFTimelineMobSlot>(Get(master, &IAAFMob::LookupSlot, aafSlotID_t{1}));
+    EXPECT_EQ(30, Get(made, &IAAFTimelineMobSlot::GetEditRate).numerator);
+}
+
 class Pulldown : public SourceSearch {};
 
 TEST_F(Pulldown, IsAsLongAsItsClipBecomes) {
