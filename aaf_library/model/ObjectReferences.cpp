@@ -169,8 +169,8 @@ Object* Object::FindInSet(const PropertyKey& key, const void* keyBytes, std::siz
     const auto& elements = value->objects();
     const auto place =
         std::partition_point(elements.begin(), elements.end(), [&](const RefPtr<Object>& at) {
-            const Bytes& key = KeyOf(*at);
-            return std::lexicographical_compare(key.begin(), key.end(), first, last);
+            const Bytes& id = KeyOf(*at);
+            return std::lexicographical_compare(id.begin(), id.end(), first, last);
         });
     if (place == elements.end()) {
         return nullptr;

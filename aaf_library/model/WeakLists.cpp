@@ -34,10 +34,10 @@ HRESULT ReadWeakCount(const Object& object, const PropertyKey& key, aafUInt32* c
 }
 
 aafUInt32 FindWeak(const Object& object, const PropertyKey& key, const GUID& id) {
+    const PropertyValue* const ids = object.FindValue(key);
     const aafUInt32 count = CountWeak(object, key);
     aafUInt32 place = 0;
-    while (place < count &&
-           GuidAt(object.FindValue(key)->bytes().data() + place * kGuidSize) != id) {
+    while (place < count && GuidAt(ids->bytes().data() + place * kGuidSize) != id) {
         ++place;
     }
     return place;
@@ -83,22 +83,20 @@ HRESULT RemoveWeak(Object& object, const PropertyKey& key, IUnknown* target) {
 }
 
 HRESULT AddWeakToSet(Object& object, const PropertyKey& key, IUnknown* target) {
-    const HRESULT result = object.AppendWeak(key, target);
-    if (result < 0) {
+    const aafUInt32 count = CountWeak(object, key);
+    if (const HRESULT result = object.AppendWeak(key, target); result < 0) {
         return result;
     }
     Bytes& ids = object.RequireValue(key)->BytesToChange();
-    const std::size_t count = ids.size() / kGuidSize - 1;
     const std::uint8_t* const added = ids.data() + count * kGuidSize;
-    std::size_t place = 0;
-    int order = -1;
-    while (place < count &&
-           (order = std::memcmp(ids.data() + place * kGuidSize, added, kGuidSize)) < 0) {
-        ++place;
-    }
-    if (order == 0) {
+    // A file, or a caller by way of values, may have them in any order.
+    if (FindWeak(object, key, GuidAt(added)) < count) {
         ids.resize(count * kGuidSize);
         return AAFRESULT_OBJECT_ALREADY_ATTACHED;
+    }
+    std::size_t place = 0;
+    while (place < count && std::memcmp(ids.data() + place * kGuidSize, added, kGuidSize) < 0) {
+        ++place;
     }
     MoveLastTo(ids, place);
     return AAFRESULT_SUCCESS;

@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "aaf_library/model/PropertyKeys.h"
 #include "tests/unit/aaf_library/objects/SavedFile.h"
 
 // Effects: their definitions in the dictionary, and their use in a composition.
@@ -189,6 +190,32 @@ TEST_F(Effect, DefinitionOrdersItsParameters) {
         EXPECT_EQ(ids, IdsOf(Get(made, &IAAFOperationDef::GetParameterDefs).get(),
                              &IEnumAAFParameterDefs::NextOne));
     }
+}
+
+// A caller who sets them as a value may have them in any order.
+TEST_F(Effect, DefinitionHasEachParameterOnce) {
+    Ptr<IAAFOperationDef> blend = Registered(kBlend, L"Blend");
+    Ptr<IAAFObject> object = As<IAAFObject>(blend);
+    Ptr<IAAFPropertyDef> all =
+        Get(Get(object, &IAAFObject::GetDefinition), &IAAFClassDef::LookupPropertyDef,
+            aaf::prop::OperationDefinition_ParametersDefined.id);
+    Ptr<IAAFTypeDefSet> set = As<IAAFTypeDefSet>(Get(all, &IAAFPropertyDef::GetTypeDef));
+    Ptr<IAAFTypeDefObjectRef> reference =
+        As<IAAFTypeDefObjectRef>(Get(set, &IAAFTypeDefSet::GetElementType));
+    Ptr<IAAFPropertyValue> value;
+    ASSERT_EQ(AAFRESULT_SUCCESS, object->CreateOptionalPropertyValue(all, value.Out()));
+    for (const aafUID_t& id : {kLevel, kSoftness}) {
+        Ptr<IAAFPropertyValue> element;
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  reference->CreateValue(RegisteredParameter(id), element.Out()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, set->AddElement(value, element));
+    }
+    for (const aafUID_t& id : {kLevel, kSoftness}) {
+        EXPECT_EQ(
+            AAFRESULT_OBJECT_ALREADY_ATTACHED,
+            blend->AddParameterDef(Get(dictionary_, &IAAFDictionary::LookupParameterDef, id)));
+    }
+    EXPECT_EQ(2u, Get(blend, &IAAFOperationDef::CountParameterDefs));
 }
 
 TEST_F(Effect, GroupKnowsWhatItsDefinitionSays) {
