@@ -241,6 +241,57 @@ TEST_F(Definition, OfKLVDataHasAType) {
     EXPECT_EQ(bytes.get(), Get(data, &IAAFKLVDataDefinition::GetKLVDataType).get());
 }
 
+// Definitions that nothing refers to stay in a file that is saved in place.
+TEST_F(Definition, OfACodecAndOfKLVDataAreStored) {
+    const std::u32string name = (folder_ / "own.aaf").u32string();
+    const std::wstring path{name.begin(), name.end()};
+    Ptr<IAAFFile> file;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              AAFFileOpenNewModify(path.c_str(), 0, &product_.ident, file.Out()));
+    {
+        Ptr<IAAFDictionary> dictionary = Get(file, &IAAFFile::GetDictionary);
+        Ptr<IAAFCodecDef> codec;
+        ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->CreateInstance(AUID_AAFCodecDef, IID_IAAFCodecDef,
+                                                                codec.OutUnknown()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, codec->Initialize(kOne, L"Codec", L""));
+        for (const aafUID_t& id : {kAAFDataDef_LegacyPicture, kAAFDataDef_LegacySound}) {
+            EXPECT_EQ(AAFRESULT_SUCCESS,
+                      codec->AddEssenceKind(Get(dictionary, &IAAFDictionary::LookupDataDef, id)));
+        }
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  codec->RemoveEssenceKind(
+                      Get(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_LegacyPicture)));
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  codec->SetFileDescriptorClass(
+                      Get(dictionary, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor)));
+        ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->RegisterCodecDef(codec));
+        Ptr<IAAFKLVDataDefinition> data;
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  dictionary->CreateInstance(AUID_AAFKLVDataDefinition, IID_IAAFKLVDataDefinition,
+                                             data.OutUnknown()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, data->Initialize(kTwo, L"Data", L""));
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  data->SetKLVDataType(
+                      Get(dictionary, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational)));
+        ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFDictionary2>(dictionary)->RegisterKLVDataDef(data));
+    }
+    ASSERT_EQ(AAFRESULT_SUCCESS, file->Save());
+    ASSERT_EQ(AAFRESULT_SUCCESS, file->Close());
+    Ptr<IAAFFile> read;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, read.Out()));
+    Ptr<IAAFDictionary> dictionary = Get(read, &IAAFFile::GetDictionary);
+    Ptr<IAAFCodecDef> codec = Get(dictionary, &IAAFDictionary::LookupCodecDef, kOne);
+    ASSERT_EQ(1u, Get(codec, &IAAFCodecDef::CountEssenceKinds));
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_LegacySound).get(),
+              Get(Get(codec, &IAAFCodecDef::GetEssenceKinds), &IEnumAAFDataDefs::NextOne).get());
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor).get(),
+              Get(codec, &IAAFCodecDef::GetFileDescriptorClass).get());
+    Ptr<IAAFKLVDataDefinition> data =
+        Get(As<IAAFDictionary2>(dictionary), &IAAFDictionary2::LookupKLVDataDef, kTwo);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational).get(),
+              Get(data, &IAAFKLVDataDefinition::GetKLVDataType).get());
+}
+
 // The class of descriptors that a codec serves may be one that only its file knows.
 TEST_F(Definition, OfACodecIsClonedWithItsClass) {
     Ptr<IAAFClassDef> own;
