@@ -125,26 +125,29 @@ HRESULT ContentStorage::RemoveMob(IAAFMob* mob) {
 
 HRESULT ContentStorage::AddCopy(const Mob& source, bool withEssence, RefPtr<Mob>& copy) {
     const aafMobID_t id = source.id();
-    if (FindMob(id) != nullptr) {
+    const auto* const from = dynamic_cast<const ContentStorage*>(source.owner());
+    const Object* const essence = withEssence && from != nullptr ? from->FindEssence(id) : nullptr;
+    if (FindMob(id) != nullptr || (essence != nullptr && FindEssence(id) != nullptr)) {
         return AAFRESULT_DUPLICATE_MOBID;
     }
     const RefPtr<Object> copied = model()->CopyObject(source);
+    const RefPtr<Object> copiedEssence =
+        essence == nullptr ? nullptr : model()->CopyObject(*essence);
     copy = RefPtr<Mob>(dynamic_cast<Mob*>(copied.get()));
-    if (!copy) {
+    if (!copy || (essence != nullptr && !copiedEssence)) {
         return AAFRESULT_INTERNAL_ERROR;
     }
     const HRESULT result = AddToSet(prop::ContentStorage_Mobs, copy->Identity());
-    const ContentStorage* const from = dynamic_cast<const ContentStorage*>(source.owner());
-    if (result < 0 || !withEssence || from == nullptr) {
-        return result;
+    return result < 0 || !copiedEssence
+               ? result
+               : AddToSet(prop::ContentStorage_EssenceData, copiedEssence->Identity());
+}
+
+void ContentStorage::RemoveCopy(Mob& copy) {
+    if (Object* const essence = FindEssence(copy.id())) {
+        RemoveObject(prop::ContentStorage_EssenceData, essence->Identity());
     }
-    const Object* const essence = from->FindEssence(id);
-    if (essence == nullptr) {
-        return result;
-    }
-    const RefPtr<Object> copiedEssence = model()->CopyObject(*essence);
-    return !copiedEssence ? AAFRESULT_INTERNAL_ERROR
-                          : AddToSet(prop::ContentStorage_EssenceData, copiedEssence->Identity());
+    RemoveObject(prop::ContentStorage_Mobs, copy.Identity());
 }
 
 HRESULT ContentStorage::CountEssenceData(aafUInt32* result) {

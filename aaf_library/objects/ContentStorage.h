@@ -25,6 +25,8 @@ public:
     bool HoldsMobsAlone() const;
     // Adds a copy of a mob of any file, with its essence if that is wanted.
     HRESULT AddCopy(const Mob& source, bool withEssence, RefPtr<Mob>& copy);
+    // Takes such a copy out again.
+    void RemoveCopy(Mob& copy);
 
     HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) override;
     HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) override;

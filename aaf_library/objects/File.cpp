@@ -306,7 +306,7 @@ HRESULT File::TakeMobs(const ContentStorage& from) {
     }
     // All or nothing.
     while (result < 0 && to.MobCount() > 0) {
-        to.RemoveObjectAt(prop::ContentStorage_Mobs, 0);
+        to.RemoveCopy(*RefPtr<Mob>(to.MobAt(0)));
     }
     return result;
 }

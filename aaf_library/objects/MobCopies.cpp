@@ -30,32 +30,53 @@ void ForEachReference(const Object& object, const std::function<void(SourceRefer
     }
 }
 
-// Copies the mobs that a mob leads to. Those that are there already are taken as they are, so
-// circles end; a way may be as long as a file has mobs.
-HRESULT CopyReferredTo(const Mob& first, bool withEssence, ContentStorage& target) {
-    const auto* const source = dynamic_cast<const ContentStorage*>(first.owner());
-    std::vector<const Mob*> waiting;
-    if (source != nullptr) {
-        waiting.push_back(&first);
+// Copies a mob and, if wanted, those that it leads to: all of them or none. Those that are there
+// already are taken as they are, so circles end; a way may be as long as a file has mobs.
+class Cloning {
+public:
+    Cloning(ContentStorage& target, bool withEssence)
+        : target_(target), withEssence_(withEssence) {}
+
+    HRESULT Add(const Mob& mob) {
+        RefPtr<Mob> copy;
+        const HRESULT result = target_.AddCopy(mob, withEssence_, copy);
+        if (result >= 0) {
+            copies_.push_back(copy);
+            waiting_.push_back(&mob);
+        }
+        return result;
     }
-    HRESULT result = AAFRESULT_SUCCESS;
-    while (result >= 0 && !waiting.empty()) {
-        const Mob& mob = *waiting.back();
-        waiting.pop_back();
-        ForEachReference(mob, [&](const SourceReference& reference) {
-            aafMobID_t id{};
-            reference.ReadStruct(prop::SourceReference_SourceID, &id);
-            const Mob* const needed = source->FindMob(id);
-            if (needed == nullptr || target.FindMob(id) != nullptr || result < 0) {
-                return;
-            }
-            RefPtr<Mob> copy;
-            result = target.AddCopy(*needed, withEssence, copy);
-            waiting.push_back(needed);
-        });
+
+    HRESULT AddReferredTo(const ContentStorage& source) {
+        HRESULT result = AAFRESULT_SUCCESS;
+        while (result >= 0 && !waiting_.empty()) {
+            const Mob& mob = *waiting_.back();
+            waiting_.pop_back();
+            ForEachReference(mob, [&](const SourceReference& reference) {
+                aafMobID_t id{};
+                reference.ReadStruct(prop::SourceReference_SourceID, &id);
+                const Mob* const needed = source.FindMob(id);
+                if (needed != nullptr && target_.FindMob(id) == nullptr && result >= 0) {
+                    result = Add(*needed);
+                }
+            });
+        }
+        return result;
     }
-    return result;
-}
+
+    const RefPtr<Mob>& first() const { return copies_.front(); }
+    void TakeBack() {
+        for (const RefPtr<Mob>& copy : copies_) {
+            target_.RemoveCopy(*copy);
+        }
+    }
+
+private:
+    ContentStorage& target_;
+    bool withEssence_;
+    std::vector<RefPtr<Mob>> copies_;
+    std::vector<const Mob*> waiting_;  // whose references were not followed yet
+};
 
 }  // namespace
 
@@ -86,13 +107,17 @@ HRESULT Mob::CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includ
     if (target == nullptr) {
         return AAFRESULT_NOT_OPEN;
     }
-    const bool withEssence = includeMedia == kAAFIncludeMedia;
-    RefPtr<Mob> copy;
-    HRESULT result = target->AddCopy(*this, withEssence, copy);
-    if (result >= 0 && resolveDependencies == kAAFFollowDepend) {
-        result = CopyReferredTo(*this, withEssence, *target);
+    Cloning cloning(*target, includeMedia == kAAFIncludeMedia);
+    HRESULT result = cloning.Add(*this);
+    const auto* const source = dynamic_cast<const ContentStorage*>(owner());
+    if (result >= 0 && resolveDependencies == kAAFFollowDepend && source != nullptr) {
+        result = cloning.AddReferredTo(*source);
     }
-    return result < 0 ? result : GiveOut(copy.get(), destMob);
+    if (result < 0) {
+        cloning.TakeBack();
+        return result;
+    }
+    return GiveOut(cloning.first().get(), destMob);
 }
 
 HRESULT Mob::Copy(aafCharacter_constptr destMobName, IAAFMob** destMob) {
