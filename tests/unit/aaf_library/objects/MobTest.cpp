@@ -456,7 +456,7 @@ TEST_F(Mob, IsClonedWithAllThatItNeedsOrNotAtAll) {
 
 // However long the way, it takes no more stack.
 TEST_F(Mob, IsClonedWithAllMobsOfALongWay) {
-    constexpr std::uint32_t kMobs = 10000;
+    constexpr std::uint32_t kMobs = 15000;
     const auto idOf = [](std::uint32_t number) {
         aafMobID_t id = MobId(1);
         id.SMPTELabel[1] = static_cast<aafUInt8>(number >> 8);
