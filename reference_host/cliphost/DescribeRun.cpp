@@ -188,8 +188,7 @@ void DescribeRun::WriteColumns() const {
     };
     write(table.header());
     for (const auto& [movie, values] : columns_) {
-        write(
-            table.Cells(MachinePath(std::filesystem::absolute(movie).lexically_normal()), values));
+        write(table.Cells(AbsoluteMachinePath(movie), values));
     }
     out.Finish();
     const auto tellLeftOut = [&](std::size_t count, const char* thing, const std::string& why) {

@@ -19,6 +19,7 @@
 #include <sstream>
 #include <thread>
 
+#include "reference_host/util/text/FileUrl.h"
 #include "tests/system/Command.h"
 #include "tests/system/SystemTest.h"
 
@@ -289,6 +290,38 @@ TEST_F(Inputs, ComeOutOfFoldersByTheirEndings) {
     Run("describe in/a.mov --aaf named.aaf" + std::string(kPinned));
     Run("describe in --extensions mov --out-dir out" + std::string(kPinned));
     EXPECT_EQ(ReadFile(folder() / "out/a.aaf"), ReadFile(folder() / "named.aaf"));
+}
+
+// Whatever the working folder is, and by whichever way: the same locators.
+TEST_F(Inputs, AreDescribedAlikeHoweverTheyAreNamed) {
+    Copy("real/in/a.mov");
+    std::filesystem::create_directories(folder() / "real/in/sub");
+    std::filesystem::create_directory_symlink("real/in/sub", folder() / "link");
+    Run("describe " + In("real/in/a.mov") + " --aaf whole.aaf" + kPinned);
+    const movies::Bytes whole = ReadFile(folder() / "whole.aaf");
+    const std::string url = host::text::FileUrl((folder() / "real/in/a.mov").native());
+    EXPECT_NE(Run("dump whole.aaf").out.find("\"" + url + "\""), std::string::npos);
+    const struct {
+        const char *from, *inputs;
+    } calls[] = {{".", "real/in/a.mov"},
+                 {".", "real/in"},
+                 {".", "./real/../real/in/a.mov"},
+                 {".", "link/../a.mov"},
+                 {".", "link/.."},
+                 {".", "link/.. --extensions mov"},
+                 {".", "link/../.. --recursive"},
+                 {".", "link/../a.mov --limit-seconds 60"},
+                 {"real/in", "a.mov"},
+                 {"real/in", "."},
+                 {"real/in/sub", "../a.mov"},
+                 {"link", "../../in"}};
+    for (const auto& call : calls) {
+        std::filesystem::remove_all(folder() / "out");
+        Run(std::string("describe ") + call.inputs + " --out-dir " + In("out") + kPinned,
+            "cd " + std::string(call.from) + " && ");
+        EXPECT_EQ(NamesIn(folder() / "out"), Names{"a.aaf"}) << call.inputs;
+        EXPECT_EQ(ReadFile(folder() / "out/a.aaf"), whole) << call.from << ": " << call.inputs;
+    }
 }
 
 TEST_F(Inputs, AreShownInLinesThatAreTheEntriesOfAList) {

@@ -28,6 +28,14 @@ TEST(MachinePath, IsAUrlWhereThePathLooksLikeOne) {
     EXPECT_NE(here.find("/file%3A///a.mov"), std::string::npos) << here;
 }
 
+TEST(MachinePath, GoesWhereALinkLeadsInUrlsToo) {
+    const TestFolder folder;
+    const std::filesystem::path root = std::filesystem::canonical(folder.path());
+    std::filesystem::create_directories(root / "a/b");
+    std::filesystem::create_directory_symlink("a/b", root / "link");
+    EXPECT_EQ(MachinePath(root / "link/../caf\xE9.mov"), MachinePath(root / "a/caf\xE9.mov"));
+}
+
 TEST(AbsolutePath, GoesWhereALinkLeads) {
     const TestFolder folder;
     const std::filesystem::path root = std::filesystem::canonical(folder.path()) / "";
