@@ -13,7 +13,6 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
-#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
 #include "reference_host/cliphost/Words.h"
@@ -115,17 +114,11 @@ void DescribeRun::Planned(const MoviePlan& plan) {
     RefuseOutputsOntoOthers();
     const std::shared_ptr<const MovieColumns>& table = options_.form.columns;
     const std::filesystem::path& written = options_.form.columnsOut;
-    const bool mayBeMovie = !written.empty() && host::system::NumberOf(written).has_value();
+    RefuseOntoMovie(written);
     std::map<const MovieColumns::Row*, std::size_t> places;
-    for (std::size_t i = 0; i < plan.size() && (table || mayBeMovie); ++i) {
+    for (std::size_t i = 0; i < plan.size() && table; ++i) {
         const MovieStep step = plan[i];
-        if (!step.IsMovie()) {
-            continue;
-        }
-        if (mayBeMovie) {
-            RefuseOutputOntoMovie(written, step.movie);
-        }
-        const MovieColumns::Row* const row = table ? table->Find(step.movie) : nullptr;
+        const MovieColumns::Row* const row = step.IsMovie() ? table->Find(step.movie) : nullptr;
         if (row == nullptr) {
             continue;
         }
