@@ -152,4 +152,10 @@ const MovieColumns::Row* MovieColumns::Find(const std::filesystem::path& movie) 
     return nullptr;
 }
 
+void GivenColumns::Read() {
+    if (!file.empty()) {
+        table = std::make_shared<const MovieColumns>(file);
+    }
+}
+
 }  // namespace cliphost

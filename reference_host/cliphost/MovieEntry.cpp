@@ -9,11 +9,11 @@
 #include <string_view>
 
 #include "reference_host/cliphost/AafTree.h"
+#include "reference_host/cliphost/ClipColumns.h"
 #include "reference_host/cliphost/JsonText.h"
 #include "reference_host/cliphost/PngFile.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/RouteTaken.h"
-#include "reference_host/cliphost/TimecodeText.h"
 #include "reference_host/util/text/Number.h"
 
 namespace cliphost {
@@ -83,26 +83,6 @@ const TreeNode* LeadingSlot(const TreeNode& mob) {
     const std::vector<TreeNode>& slots = PartsOf(mob, "Slots");
     const auto picture = std::find_if(slots.begin(), slots.end(), IsOfPictures);
     return picture != slots.end() ? &*picture : slots.empty() ? nullptr : &slots.front();
-}
-
-// The first timecode track of the source mob counts from 0; where in it the file begins is told by
-// the file mob.
-std::string StartOf(const TreeNode& file, const TreeNode& source) {
-    const TreeNode* const slot = LeadingSlot(file);
-    const TreeNode* const clip = slot ? PartOf(*slot, "Segment") : nullptr;
-    for (const TreeNode& track : PartsOf(source, "Slots")) {
-        const TreeNode* timecode = PartOf(track, "Segment");
-        if (timecode && timecode->title == "Sequence") {
-            timecode = PartOf(*timecode, "Components");
-        }
-        if (timecode && timecode->title == "Timecode") {
-            const std::int64_t start = NumberOf(FactOf(*timecode, "Start")) +
-                                       (clip ? NumberOf(FactOf(*clip, "StartTime")) : 0);
-            return TimecodeText(start, NumberOf(FactOf(*timecode, "FPS")),
-                                FactOf(*timecode, "Drop").compare(0, 4, "True") == 0);
-        }
-    }
-    return {};
 }
 
 std::string PropertiesOf(const TreeNode& descriptor) {
@@ -179,12 +159,14 @@ void AddTracks(const TreeNode& file, const MovieCodecs& codecs, Entry& entry) {
     movie["channels"] = std::to_string(channels);
 }
 
-void AddColumns(const TreeNode& mob, Entry& entry) {
-    for (const TreeNode& comment : PartsOf(mob, "UserComments")) {
+void AddColumns(ColumnValues columns, const std::string& reel, Entry& entry) {
+    if (!reel.empty()) {
+        columns.emplace_back("Reel", reel);
+    }
+    for (auto& [name, value] : columns) {
         const std::string place = std::to_string(entry["columns"].size());
-        entry["columns"].push_back({{"place", place},
-                                    {"name", Unquoted(FactOf(comment, "Name"))},
-                                    {"value", Unquoted(FactOf(comment, "Value"))}});
+        entry["columns"].push_back(
+            {{"place", place}, {"name", std::move(name)}, {"value", std::move(value)}});
     }
 }
 
@@ -261,7 +243,8 @@ Entry EntryOf(const Description& description, CodecReader& codecs) {
         return entry;
     }
     const TreeNode& file = mobs[1];
-    Set(movie, "name", Unquoted(FactOf(mobs[0], "Name")));
+    ClipTexts texts = TextsOf(description.file.get());
+    Set(movie, "name", texts.name);
     movie["master_mob"] = FactOf(mobs[0], "MobID");
     movie["file_mob"] = FactOf(file, "MobID");
     movie["source_mob"] = FactOf(mobs[2], "MobID");
@@ -270,9 +253,9 @@ Entry EntryOf(const Description& description, CodecReader& codecs) {
         const TreeNode* const segment = PartOf(*slot, "Segment");
         Set(movie, "length", segment ? FactOf(*segment, "Length") : "");
     }
-    Set(movie, "start", StartOf(file, mobs[2]));
+    Set(movie, "start", texts.start);
     AddTracks(file, codecs.Read(description.movie, header), entry);
-    AddColumns(mobs[0], entry);
+    AddColumns(std::move(texts.binColumns), texts.reel, entry);
     if (description.doubt) {
         entry["warnings"].push_back(WarningRow(description.doubt, "doubt", 0));
     }

@@ -225,6 +225,11 @@ void MoviesRun::TellStop() {
            failed_, Left(), HowToGoOn());
 }
 
+Description MoviesRun::DescriptionOf(const MovieStep& step) {
+    return step.folder ? DescribeFromList(session_, step.folder->list(), step.index, step.movie)
+                       : DescribeMovie(session_, step.movie);
+}
+
 void MoviesRun::RefuseOntoMovie(const std::filesystem::path& output) const {
     const auto inItsPlace = host::system::NumberOf(output);
     for (std::size_t i = 0; inItsPlace && i < plan().size(); ++i) {

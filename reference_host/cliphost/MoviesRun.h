@@ -80,6 +80,8 @@ protected:
     bool IsStopped() const { return isStopped_; }
 
     Session& session() { return session_; }
+    // In this process; of a folder's movie out of the module's list.
+    Description DescriptionOf(const MovieStep& step);
     // Tells a problem that is not a movie's; it counts for the exit status.
     void TellAlso(const Failure& failure);
 
