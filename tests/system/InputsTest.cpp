@@ -838,6 +838,36 @@ TEST_F(Stopped, WritesNoPartOfABin) {
     }
 }
 
+// A signal that comes when the last movie is read finds nothing that could still be lost.
+TEST_F(Inputs, AreKeptWhereASignalComesBehindTheLast) {
+    Copy("a.mov");
+    Copy("interrupt.mov");
+    Copy("b.mov");
+    Run("catalog b.mov -o all.sqlite");
+    const auto run = [&](const std::string& arguments) {
+        const CommandResult ran =
+            RunCommand("cd " + Quoted(folder()) + "; env --default-signal=TERM " + Program() +
+                       " --plugin " + Quoted(ProgramFolder() / "tests/BreakingModule.nvx") + " " +
+                       arguments + " --jobs 1 >printed 2>told; echo $?");
+        EXPECT_EQ(ran.out, "143\n") << arguments;
+        EXPECT_EQ(Told().find("not all movies were read"), std::string::npos) << Told();
+        return TextOf(folder() / "printed");
+    };
+    const std::string described =
+        run("describe a.mov interrupt.mov absent.mov --json --bin all.aaf --columns-out all.csv");
+    const Json list = Json::parse(described, nullptr, false);
+    ASSERT_EQ(list.size(), 3u) << described;
+    EXPECT_EQ(list[2]["reason"], "there is no such file or folder");
+    ExpectSays(RunCliphost("verify " + In("all.aaf")), 0, "1 clip: 1 same");
+    EXPECT_NE(TextOf(folder() / "all.csv").find("interrupt.mov"), std::string::npos);
+    EXPECT_EQ(run("catalog a.mov interrupt.mov -o all.sqlite"), "2 catalogued, 0 not\n");
+    EXPECT_EQ(Run("find all.sqlite name:b").status, 1);
+    EXPECT_EQ(Run("find all.sqlite name:interrupt").status, 0);
+    EXPECT_NE(run("describe a.mov interrupt.mov -q --out-dir out").find("2 described, 0 not\n"),
+              std::string::npos);
+    EXPECT_EQ(NamesIn(folder() / "out"), (Names{"a.aaf", "interrupt.aaf"}));
+}
+
 TEST_F(Inputs, AreNeverReplacedByAnOutputOfTheSameRun) {
     Copy("in/clip.mov");
     Copy("in/clip.png");
