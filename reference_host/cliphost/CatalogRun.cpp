@@ -203,7 +203,8 @@ std::size_t CatalogRun::RemoveGone() {
     return gone.size();
 }
 
-// One that is there stays where this one has only a part of the movies, or none: a disk may be away.
+// One that is there stays where this one has only a part of the movies, or none: a disk may be
+// away.
 void CatalogRun::PutIntoPlace() {
     if (made_->TakesPlace() && IsStopped()) {
         return;

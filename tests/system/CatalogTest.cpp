@@ -371,9 +371,8 @@ TEST_F(Catalogs, StayWhereNoMovieIsFound) {
                                    "--files-from list", "empty --extensions mov --shard 1/4"}) {
         const CommandResult ran = Run(std::string("catalog -o c.sqlite ") + call);
         EXPECT_GE(ran.status, 1) << call;
-        EXPECT_NE(
-            ran.out.find("c.sqlite: no movie was found; the catalog is left as it was\n"),
-            std::string::npos)
+        EXPECT_NE(ran.out.find("c.sqlite: no movie was found; the catalog is left as it was\n"),
+                  std::string::npos)
             << ran.out;
         EXPECT_TRUE(TextOf(folder() / "c.sqlite") == before) << call;
         EXPECT_EQ(FilesNamed("c.sqlite"), 1u) << call;
@@ -753,12 +752,13 @@ TEST_F(FindVerb, KeepsNobodyFromWritingWhileItsReaderRests) {
 TEST_F(FindVerb, HoldsNoMoreOfManyMoviesThanOfFew) {
     const auto memory = [&](int movies, const std::string& form) {
         Database(folder() / "c.sqlite", Database::Access::Change)
-            .Run(("DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM "
-                  "n WHERE i < " +
-                  std::to_string(movies) +
-                  ") INSERT INTO movies (id, path, name, size, date, looked, settings, failed) "
-                  "SELECT i, '/' || i || hex(zeroblob(200)), '', 1, 1, 1, '', 0 FROM n")
-                     .c_str());
+            .Run(
+                ("DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM "
+                 "n WHERE i < " +
+                 std::to_string(movies) +
+                 ") INSERT INTO movies (id, path, name, size, date, looked, settings, failed) "
+                 "SELECT i, '/' || i || hex(zeroblob(200)), '', 1, 1, 1, '', 0 FROM n")
+                    .c_str());
         // At the first byte, in kilobytes.
         const CommandResult ran = RunCommand(
             "cd " + Quoted(folder()) + "; sh -c 'echo $$ >pid; exec \"$0\" find c.sqlite " + form +
@@ -775,9 +775,10 @@ TEST_F(FindVerb, HoldsNoMoreOfManyMoviesThanOfFew) {
 // All of it, where it takes several readings.
 TEST_F(FindVerb, GivesWholeJsonOfManyMovies) {
     Database(folder() / "c.sqlite", Database::Access::Change)
-        .Run("DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
-             "WHERE i < 1500) INSERT INTO movies (id, path, name, size, date, looked, settings, "
-             "failed) SELECT i, printf('/%06d', 1500 - i), '', 1, 1, 1, '', 0 FROM n");
+        .Run(
+            "DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
+            "WHERE i < 1500) INSERT INTO movies (id, path, name, size, date, looked, settings, "
+            "failed) SELECT i, printf('/%06d', 1500 - i), '', 1, 1, 1, '', 0 FROM n");
     const std::string printed = Run("find c.sqlite --json").out;
     const Json answer = Json::parse(printed);
     ASSERT_EQ(answer["movies"].size(), 1500u);
@@ -792,10 +793,11 @@ TEST_F(FindVerb, GivesWholeJsonOfManyMovies) {
 // What was printed of a catalog that can't be read to its end is no whole answer.
 TEST_F(FindVerb, LeavesJsonOpenWhereTheCatalogIsDamaged) {
     Database(folder() / "c.sqlite", Database::Access::Change)
-        .Run("DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
-             "WHERE i < 5000) INSERT INTO movies (id, path, name, size, date, looked, settings, "
-             "failed) SELECT i, printf('/%06d', i), hex(zeroblob(200)), 1, 1, 1, 'last' || i, 0 "
-             "FROM n");
+        .Run(
+            "DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
+            "WHERE i < 5000) INSERT INTO movies (id, path, name, size, date, looked, settings, "
+            "failed) SELECT i, printf('/%06d', i), hex(zeroblob(200)), 1, 1, 1, 'last' || i, 0 "
+            "FROM n");
     std::string bytes = TextOf(folder() / "c.sqlite");
     const std::size_t page = bytes.find("last4900") / 4096 * 4096;
     std::fill_n(bytes.begin() + static_cast<std::ptrdiff_t>(page), 4096, '\x55');
