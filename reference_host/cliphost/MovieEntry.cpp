@@ -85,6 +85,19 @@ const TreeNode* LeadingSlot(const TreeNode& mob) {
     return picture != slots.end() ? &*picture : slots.empty() ? nullptr : &slots.front();
 }
 
+constexpr char kMasterMob[] = "MasterMob";
+
+// The mob whose descriptor has this class, or which has the class itself. A tape may be among them.
+const TreeNode* MobOf(const TreeNode& description, std::string_view name) {
+    for (const TreeNode& mob : PartsOf(description, "Mobs")) {
+        const TreeNode* const descriptor = PartOf(mob, "EssenceDescription");
+        if (name == (descriptor ? descriptor->title : mob.title)) {
+            return &mob;
+        }
+    }
+    return nullptr;
+}
+
 std::string PropertiesOf(const TreeNode& descriptor) {
     std::string json;
     for (const TreeNode::Fact& fact : descriptor.facts) {
@@ -237,24 +250,24 @@ Entry EntryOf(const Description& description, CodecReader& codecs) {
     movie["route"] = taken.route;
     Set(movie, "route_reason", taken.reason);
     const TreeNode tree = ReadTree(description.file.get());
-    const std::vector<TreeNode>& mobs = PartsOf(tree, "Mobs");
-    constexpr std::size_t kMobs = 3;  // master, file and source
-    if (mobs.size() < kMobs) {
+    const TreeNode* const master = MobOf(tree, kMasterMob);
+    const TreeNode* const file = MobOf(tree, "MultipleDescriptor");
+    const TreeNode* const source = MobOf(tree, "ImportDescriptor");
+    if (!master || !file || !source) {
         return entry;
     }
-    const TreeNode& file = mobs[1];
     ClipTexts texts = TextsOf(description.file.get());
     Set(movie, "name", texts.name);
-    movie["master_mob"] = FactOf(mobs[0], "MobID");
-    movie["file_mob"] = FactOf(file, "MobID");
-    movie["source_mob"] = FactOf(mobs[2], "MobID");
-    if (const TreeNode* const slot = LeadingSlot(mobs[0])) {
+    movie["master_mob"] = FactOf(*master, "MobID");
+    movie["file_mob"] = FactOf(*file, "MobID");
+    movie["source_mob"] = FactOf(*source, "MobID");
+    if (const TreeNode* const slot = LeadingSlot(*master)) {
         SetRate(movie, FactOf(*slot, "EditRate"));
         const TreeNode* const segment = PartOf(*slot, "Segment");
         Set(movie, "length", segment ? FactOf(*segment, "Length") : "");
     }
     Set(movie, "start", texts.start);
-    AddTracks(file, codecs.Read(description.movie, header), entry);
+    AddTracks(*file, codecs.Read(description.movie, header), entry);
     AddColumns(std::move(texts.binColumns), texts.reel, entry);
     if (description.doubt) {
         entry["warnings"].push_back(WarningRow(description.doubt, "doubt", 0));
