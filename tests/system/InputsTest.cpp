@@ -843,6 +843,7 @@ TEST_F(Inputs, AreKeptWhereASignalComesBehindTheLast) {
     Copy("a.mov");
     Copy("interrupt.mov");
     Copy("b.mov");
+    std::filesystem::create_directory(folder() / "empty");
     Run("catalog b.mov -o all.sqlite");
     const auto run = [&](const std::string& arguments) {
         const CommandResult ran =
@@ -854,10 +855,10 @@ TEST_F(Inputs, AreKeptWhereASignalComesBehindTheLast) {
         return TextOf(folder() / "printed");
     };
     const std::string described =
-        run("describe a.mov interrupt.mov absent.mov --json --bin all.aaf --columns-out all.csv");
+        run("describe a.mov interrupt.mov empty --json --bin all.aaf --columns-out all.csv");
     const Json list = Json::parse(described, nullptr, false);
     ASSERT_EQ(list.size(), 3u) << described;
-    EXPECT_EQ(list[2]["reason"], "there is no such file or folder");
+    EXPECT_EQ(list[2]["reason"], "not claimed: no file in it is named *.mov");
     ExpectSays(RunCliphost("verify " + In("all.aaf")), 0, "1 clip: 1 same");
     EXPECT_NE(TextOf(folder() / "all.csv").find("interrupt.mov"), std::string::npos);
     EXPECT_EQ(run("catalog a.mov interrupt.mov -o all.sqlite"), "2 catalogued, 0 not\n");

@@ -25,7 +25,7 @@ TEST(MachinePath, IsAUrlWhereBytesAreNoText) {
 
 TEST(MachinePath, IsAUrlWhereThePathLooksLikeOne) {
     const std::string here = MachinePath("file:///a.mov");
-    EXPECT_NE(here.find("/file%3A///a.mov"), std::string::npos) << here;
+    EXPECT_NE(here.find("/file%3A/a.mov"), std::string::npos) << here;
 }
 
 TEST(MachinePath, GoesWhereALinkLeadsInUrlsToo) {
