@@ -2,13 +2,13 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <map>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
 #include <string>
 
 #include "reference_host/cliphost/Bin.h"
 #include "reference_host/cliphost/MoviesRun.h"
+#include "reference_host/cliphost/RowsOfMovies.h"
 
 namespace cliphost {
 
@@ -36,7 +36,6 @@ private:
     void Finish(int described, int failed) override;
     void Planned(const MoviePlan& plan) override;
     void RefuseOutputsOntoOthers() const;
-    void TellUnusedRows() const;
     void WriteColumns() const;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
     void SaveBin();
@@ -45,9 +44,9 @@ private:
 
     const DescribeOptions& options_;
     PathMaps maps_;  // to know which were used
+    RowsOfMovies rows_;
     std::optional<Bin> bin_;
     std::filesystem::path copyOf_;  // what the last movie that went into the bin is a copy of
-    std::map<const MovieColumns::Row*, std::string> movieOfRow_;
     std::vector<std::pair<std::filesystem::path::string_type, ColumnValues>> columns_;
     std::vector<std::string> entries_;  // of the JSON list that comes at the end
 };

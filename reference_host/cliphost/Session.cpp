@@ -11,6 +11,7 @@
 #include "host_interfaces/util/NMALogger.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/QTParser.h"
@@ -148,9 +149,7 @@ Problem BackslashProblem(const std::filesystem::path& path) {
 }
 
 host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
-    std::error_code error;
-    const std::filesystem::path absolute =
-        std::filesystem::absolute(path, error).lexically_normal();
+    const std::filesystem::path absolute = AbsolutePath(path);
     if (Problem problem = WhyUnreachable(path)) {
         throw Failure(kExitCaller, std::move(problem));
     }
