@@ -2,10 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/stored/CompoundDirectory.h"
 #include "aaf_library/stored/CompoundFileFormat.h"
 #include "aaf_library/stored/StoredTree.h"
 
-#include <array>
 #include <optional>
 #include <string>
 #include <vector>
@@ -47,23 +47,10 @@ public:
     std::optional<CompoundPart> FinishPart();
 
 private:
-    // A directory entry among those of its storage.
-    struct Place {
-        Storage holder = kRoot;
-        std::uint32_t index = 0;
-        std::size_t length = 0;
-        std::array<char16_t, kLongestName> name{};  // in upper case
-    };
-
-    std::uint32_t AddEntry(Storage holder, const std::u16string& name, EntryKind kind);
-    std::uint8_t* EntryAt(std::uint32_t index);
-    std::u16string NameOf(std::uint32_t index);
-    void SetContent(std::uint32_t index, std::uint32_t start, std::size_t size);
     void SetHeader(std::size_t offset, std::size_t value);
     std::uint32_t AppendSectors(const Bytes& content);
     std::uint32_t NumberSectors(std::size_t size);
     std::uint32_t AppendSmallSectors(const Bytes& content);
-    void LinkSiblings();
     Bytes SmallTable();
     Bytes Table();
 
@@ -73,8 +60,7 @@ private:
     std::vector<std::uint32_t> table_;  // the sector after each sector
     Bytes small_;                       // the short streams
     std::vector<std::uint32_t> smallTable_;
-    Bytes directory_;
-    std::vector<Place> places_;
+    CompoundDirectory directory_;
 };
 
 }  // namespace aaf::stored

@@ -108,14 +108,14 @@ TEST(CompoundFileWriter, LaysOutASmallFileByteForByte) {
         root[2 * i] = static_cast<std::uint8_t>(name[i]);
     }
     const Bytes rootTail = {22,   0, 5, 1,  0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF,
-                            0xFF, 2, 0, 0,  0,    1,    2,    3,    4,    5,    6,
+                            0xFF, 1, 0, 0,  0,    1,    2,    3,    4,    5,    6,
                             7,    8, 9, 10, 11,   12,   13,   14,   15,   16};
     std::copy(rootTail.begin(), rootTail.end(), root.begin() + 64);
     root[120] = 64;
     EXPECT_EQ(entry(0), root);
 
     Bytes stream(128);
-    const Bytes streamTail = {6,    0,    2,    1,    0xFF, 0xFF, 0xFF, 0xFF,
+    const Bytes streamTail = {6,    0,    2,    1,    2,    0,    0,    0,
                               0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF};
     stream[0] = 'a';
     stream[2] = 'b';
@@ -123,9 +123,11 @@ TEST(CompoundFileWriter, LaysOutASmallFileByteForByte) {
     stream[120] = 2;
     EXPECT_EQ(entry(1), stream);
 
-    // The shorter name comes first; what has no content begins at no sector.
+    // The shorter name comes first, so it is on the left, in a last level that is not full and so
+    // red. What has no content begins at no sector.
     Bytes contained(128);
-    const Bytes containedTail = {4, 0, 1, 1, 0xFF, 0xFF, 0xFF, 0xFF, 1, 0, 0, 0, 3, 0, 0, 0};
+    const Bytes containedTail = {4,    0,    1,    0,    0xFF, 0xFF, 0xFF, 0xFF,
+                                 0xFF, 0xFF, 0xFF, 0xFF, 3,    0,    0,    0};
     contained[0] = 'c';
     std::copy(containedTail.begin(), containedTail.end(), contained.begin() + 64);
     std::fill(contained.begin() + 116, contained.begin() + 120, 0xFF);
