@@ -61,7 +61,9 @@ std::uint32_t CompoundDirectory::Add(std::uint32_t holder, const std::u16string&
     PutNumber(entry + kEntryKindOffset, static_cast<std::uint8_t>(kind));
     PutNumber(entry + kEntryColourOffset, kBlack);
     LeadNowhere(entry);
-    SetContent(index, kEndOfChain, 0);
+    if (kind != EntryKind::Storage) {
+        SetContent(index, kEndOfChain, 0);
+    }
     return index;
 }
 
@@ -96,7 +98,9 @@ void CompoundDirectory::AddLinked(std::uint32_t holder, const std::u16string& na
         moveBy(entry + kEntryLeftOffset, storage);
         moveBy(entry + kEntryRightOffset, storage);
         moveBy(entry + kEntryChildOffset, storage);
-        moveBy(entry + kEntryStartOffset, sectorsBefore);
+        if (entry[kEntryKindOffset] == static_cast<std::uint8_t>(EntryKind::Stream)) {
+            moveBy(entry + kEntryStartOffset, sectorsBefore);
+        }
     }
 }
 

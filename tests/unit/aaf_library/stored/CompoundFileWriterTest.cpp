@@ -124,15 +124,25 @@ TEST(CompoundFileWriter, LaysOutASmallFileByteForByte) {
     EXPECT_EQ(entry(1), stream);
 
     // The shorter name comes first, so it is on the left, in a last level that is not full and so
-    // red. What has no content begins at no sector.
+    // red. A storage has neither a first sector nor a size.
     Bytes contained(128);
     const Bytes containedTail = {4,    0,    1,    0,    0xFF, 0xFF, 0xFF, 0xFF,
                                  0xFF, 0xFF, 0xFF, 0xFF, 3,    0,    0,    0};
     contained[0] = 'c';
     std::copy(containedTail.begin(), containedTail.end(), contained.begin() + 64);
-    std::fill(contained.begin() + 116, contained.begin() + 120, 0xFF);
-    contained[116] = 0xFE;
     EXPECT_EQ(entry(2), contained);
+
+    // A stream without content begins at no sector.
+    Bytes empty(128);
+    const Bytes emptyTail = {10,   0,    2,    1,    0xFF, 0xFF, 0xFF, 0xFF,
+                             0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF};
+    for (std::size_t i = 0; i < 4; ++i) {
+        empty[2 * i] = static_cast<std::uint8_t>("none"[i]);
+    }
+    std::copy(emptyTail.begin(), emptyTail.end(), empty.begin() + 64);
+    std::fill(empty.begin() + 116, empty.begin() + 120, 0xFF);
+    empty[116] = 0xFE;
+    EXPECT_EQ(entry(3), empty);
 
     Bytes table(512, 0xFF);
     table[0] = table[4] = table[8] = 0xFE;
