@@ -2,7 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/CompoundFileWriter.h"
 
+#include "aaf_library/stored/CompoundFileLimits.h"
 #include "aaf_library/stored/LittleEndian.h"
+#include "aaf_library/stored/StoredError.h"
 
 #include <algorithm>
 #include <utility>
@@ -25,24 +27,33 @@ std::size_t CountOf(std::size_t size, std::size_t part) {
     return (size + part - 1) / part;
 }
 
-// The entries of a run that begins behind the last one.
-void AppendRun(std::vector<std::uint32_t>& table, std::size_t count) {
-    const std::size_t first = table.size();
-    table.resize(first + std::max<std::size_t>(count, 1));
-    for (std::size_t at = first; at < table.size(); ++at) {
-        table[at] = static_cast<std::uint32_t>(at + 1);
-    }
-    table.back() = kEndOfChain;
-}
-
 void FillUp(std::vector<std::uint32_t>& numbers, std::size_t perSector) {
     numbers.resize(CountOf(numbers.size(), perSector) * perSector, kFreeSector);
+}
+
+void FillUp(Bytes& bytes, std::size_t sectorSize) {
+    bytes.resize(CountOf(bytes.size(), sectorSize) * sectorSize);
+}
+
+// Puts zeros between pieces, or into one that reaches beyond that place.
+void OpenGap(std::vector<Bytes>& pieces, std::size_t place, std::size_t size) {
+    for (auto piece = pieces.begin(); piece != pieces.end(); ++piece) {
+        if (place < piece->size()) {
+            const auto at = piece->begin() + static_cast<std::ptrdiff_t>(place);
+            Bytes behind(at, piece->end());
+            piece->resize(place);
+            pieces.insert(piece + 1, {Bytes(size), std::move(behind)});
+            return;
+        }
+        place -= piece->size();
+    }
 }
 
 }  // namespace
 
 CompoundFileWriter::CompoundFileWriter(SectorSize sectorSize)
     : sectorSize_(static_cast<std::size_t>(sectorSize)),
+      lockSector_(LockSector(sectorSize)),
       large_(sectorSize == SectorSize::Bytes4096),
       file_(sectorSize_) {
     std::uint8_t* const header = file_.data();
@@ -69,6 +80,7 @@ CompoundFileWriter::Storage CompoundFileWriter::AddStorage(Storage holder,
 
 void CompoundFileWriter::AddStream(Storage holder, const std::u16string& name,
                                    const Bytes& content) {
+    CheckSize(BytesSoFar() + content.size());
     const std::uint32_t index = directory_.Add(holder, name, EntryKind::Stream);
     if (!content.empty()) {
         const bool small = content.size() < kSmallStreamLimit;
@@ -79,6 +91,7 @@ void CompoundFileWriter::AddStream(Storage holder, const std::u16string& name,
 
 void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
                                  const CompoundPart& part) {
+    CheckSize(BytesSoFar() + part.small.size() + part.directory.size());
     const auto sectorsBefore = static_cast<std::uint32_t>(smallTable_.size());
     if (part.small.size() > small_.size()) {
         // Leaves room for what follows the large part of a file.
@@ -121,10 +134,13 @@ std::vector<Bytes> CompoundFileWriter::FinishPieces() {
     SetHeader(kFirstDirectoryOffset, NumberSectors(directory.size()));
     SetHeader(kDirectoryCountOffset, large_ ? directory.size() / sectorSize_ : 0);
     Bytes table = Table();
-    small_.resize(CountOf(small_.size(), sectorSize_) * sectorSize_);
+    FillUp(small_, sectorSize_);
     std::vector<Bytes> pieces;
     for (Bytes* const piece : {&file_, &small_, &smallTable, &directory, &table}) {
         pieces.push_back(std::move(*piece));
+    }
+    if (lockSector_ != kFreeSector) {
+        OpenGap(pieces, (lockSector_ + std::size_t{1}) * sectorSize_, sectorSize_);
     }
     return pieces;
 }
@@ -133,23 +149,61 @@ void CompoundFileWriter::SetHeader(std::size_t offset, std::size_t value) {
     PutNumber(file_.data() + offset, static_cast<std::uint32_t>(value));
 }
 
+std::uint64_t CompoundFileWriter::BytesSoFar() {
+    return std::uint64_t{file_.size()} + small_.size() + directory_.bytes().size();
+}
+
+void CompoundFileWriter::CheckSize(std::uint64_t size) const {
+    const auto sectorSize = static_cast<SectorSize>(sectorSize_);
+    const std::uint64_t most = LargestFile(sectorSize);
+    if (size <= most) {
+        return;
+    }
+    std::string text = "takes more than " + std::to_string(most) +
+                       " bytes, the most that a file with sectors of " +
+                       std::to_string(sectorSize_) + " bytes may have";
+    if (!large_) {
+        text += "; one with sectors of 4096 bytes may have " +
+                std::to_string(LargestFile(SectorSize::Bytes4096));
+    }
+    throw TooLargeError(text);
+}
+
+// Gives the numbers of the next sectors, each of which is marked so in the table.
+std::vector<std::uint32_t> CompoundFileWriter::TakeSectors(std::size_t count, std::uint32_t mark) {
+    std::vector<std::uint32_t> numbers(count);
+    for (std::uint32_t& number : numbers) {
+        if (table_.size() == lockSector_) {
+            table_.push_back(kEndOfChain);
+        }
+        number = static_cast<std::uint32_t>(table_.size());
+        table_.push_back(mark);
+    }
+    return numbers;
+}
+
 // Gives the number of the first sector.
 std::uint32_t CompoundFileWriter::NumberSectors(std::size_t size) {
-    const auto first = static_cast<std::uint32_t>(table_.size());
-    AppendRun(table_, CountOf(size, sectorSize_));
-    return first;
+    const std::vector<std::uint32_t> chain = TakeSectors(CountOf(size, sectorSize_), kEndOfChain);
+    for (std::size_t i = 1; i < chain.size(); ++i) {
+        table_[chain[i - 1]] = chain[i];
+    }
+    return chain.front();
 }
 
 std::uint32_t CompoundFileWriter::AppendSectors(const Bytes& content) {
-    const std::uint32_t first = NumberSectors(content.size());
     file_.insert(file_.end(), content.begin(), content.end());
-    file_.resize((table_.size() + 1) * sectorSize_);
-    return first;
+    FillUp(file_, sectorSize_);
+    return NumberSectors(content.size());
 }
 
 std::uint32_t CompoundFileWriter::AppendSmallSectors(const Bytes& content) {
     const auto first = static_cast<std::uint32_t>(smallTable_.size());
-    AppendRun(smallTable_, CountOf(content.size(), kSmallSectorSize));
+    const auto end = first + static_cast<std::uint32_t>(CountOf(content.size(), kSmallSectorSize));
+    for (std::uint32_t next = first + 1; next < end; ++next) {
+        smallTable_.push_back(next);
+    }
+    smallTable_.push_back(kEndOfChain);
     small_.insert(small_.end(), content.begin(), content.end());
     small_.resize(smallTable_.size() * kSmallSectorSize);
     return first;
@@ -168,35 +222,37 @@ Bytes CompoundFileWriter::SmallTable() {
 // with it.
 Bytes CompoundFileWriter::Table() {
     const std::size_t perSector = sectorSize_ / 4;
+    // The last number of a sector of the list leads to the next one.
+    const std::size_t perList = perSector - 1;
     const std::size_t used = table_.size();
-    std::size_t tables = 0;
-    std::size_t lists = 0;
-    for (std::size_t wanted = 1; tables < wanted;) {
-        tables = wanted;
-        lists = CountOf(tables - std::min<std::size_t>(tables, kHeaderTableCount), perSector - 1);
-        wanted = CountOf(used + tables + lists, perSector);
+    std::size_t tableCount = 0;
+    std::size_t listCount = 0;
+    for (std::size_t wanted = 1; tableCount < wanted;) {
+        tableCount = wanted;
+        listCount =
+            CountOf(tableCount - std::min<std::size_t>(tableCount, kHeaderTableCount), perList);
+        const std::size_t end = used + tableCount + listCount;
+        const bool isLockAmongThem = used <= lockSector_ && lockSector_ < end;
+        wanted = CountOf(end + (isLockAmongThem ? 1 : 0), perSector);
     }
-    table_.insert(table_.end(), tables, kTableSector);
-    table_.insert(table_.end(), lists, kTableListSector);
+    const std::vector<std::uint32_t> tables = TakeSectors(tableCount, kTableSector);
+    const std::vector<std::uint32_t> lists = TakeSectors(listCount, kTableListSector);
+    CheckSize((std::uint64_t{table_.size()} + 1) * sectorSize_);
     FillUp(table_, perSector);
-    std::vector<std::uint32_t> list(kHeaderTableCount + lists * perSector, kFreeSector);
-    std::size_t at = 0;
-    for (std::size_t i = 0; i < tables; ++i) {
-        list[at] = static_cast<std::uint32_t>(used + i);
-        ++at;
-        // The last number of a sector of the list leads to the next one.
-        if (at > kHeaderTableCount && (at - kHeaderTableCount) % perSector == perSector - 1) {
-            const std::size_t next = used + tables + (at - kHeaderTableCount) / perSector + 1;
-            list[at] = static_cast<std::uint32_t>(next);
-            ++at;
-        }
+
+    std::vector<std::uint32_t> list(kHeaderTableCount + listCount * perSector, kFreeSector);
+    for (std::size_t i = 0; i < tableCount; ++i) {
+        const std::size_t linksBefore =
+            i < kHeaderTableCount ? 0 : (i - kHeaderTableCount) / perList;
+        list[i + linksBefore] = tables[i];
     }
-    if (lists > 0) {
-        list.back() = kEndOfChain;
+    for (std::size_t i = 0; i < listCount; ++i) {
+        list[kHeaderTableCount + i * perSector + perList] =
+            i + 1 < listCount ? lists[i + 1] : kEndOfChain;
     }
-    SetHeader(kTableCountOffset, tables);
-    SetHeader(kFirstTableListOffset, lists == 0 ? kEndOfChain : used + tables);
-    SetHeader(kTableListCountOffset, lists);
+    SetHeader(kTableCountOffset, tableCount);
+    SetHeader(kFirstTableListOffset, lists.empty() ? kEndOfChain : lists.front());
+    SetHeader(kTableListCountOffset, listCount);
 
     Bytes table = NumberBytes(table_);
     const Bytes listed = NumberBytes(list);

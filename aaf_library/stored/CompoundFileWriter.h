@@ -23,7 +23,8 @@ struct CompoundPart {
 // Lays a compound file out in memory. Its sectors come in this order: long
 // streams as they are added, the short streams as one and their table, the
 // directory, the allocation table, the list of its sectors.
-// The same calls give the same bytes. Throws StoredError.
+// The same calls give the same bytes. Throws StoredError, and TooLargeError as
+// soon as it is known that the file would be too large.
 class CompoundFileWriter {
 public:
     // A storage by the number of its directory entry.
@@ -48,13 +49,17 @@ public:
 
 private:
     void SetHeader(std::size_t offset, std::size_t value);
-    std::uint32_t AppendSectors(const Bytes& content);
+    std::uint64_t BytesSoFar();
+    void CheckSize(std::uint64_t size) const;
+    std::vector<std::uint32_t> TakeSectors(std::size_t count, std::uint32_t mark);
     std::uint32_t NumberSectors(std::size_t size);
+    std::uint32_t AppendSectors(const Bytes& content);
     std::uint32_t AppendSmallSectors(const Bytes& content);
     Bytes SmallTable();
     Bytes Table();
 
     const std::size_t sectorSize_;
+    const std::uint32_t lockSector_;
     const bool large_;
     Bytes file_;
     std::vector<std::uint32_t> table_;  // the sector after each sector

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/CompoundFileWriter.h"
 
+#include "aaf_library/stored/CompoundFileLimits.h"
 #include "aaf_library/stored/CompoundFileReader.h"
 #include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/UpperCase.h"
@@ -311,6 +312,14 @@ TEST(CompoundFileWriter, RefusesANameTwiceInOneStorage) {
     CompoundFileWriter writer(SectorSize::Bytes512);
     writer.AddStream(writer.AddStorage(kRoot, u"name"), u"name", {});
     EXPECT_NO_THROW(writer.Finish());
+}
+
+// Bytes from 0x7FFFFF00 on, up to 2 GiB, are where programs lock.
+TEST(CompoundFileLimits, AreThoseOfTheFormatAndOfMemory) {
+    EXPECT_EQ(LargestFile(SectorSize::Bytes512), 0x7FFFFE00u) << "the last whole sector before";
+    EXPECT_EQ(LockSector(SectorSize::Bytes512), kFreeSector) << "no file reaches it";
+    EXPECT_EQ(LargestFile(SectorSize::Bytes4096), 0x100000000u);
+    EXPECT_EQ((LockSector(SectorSize::Bytes4096) + 1) * 4096u, 0x7FFFF000u) << "the sector of it";
 }
 
 TEST(UpperCase, FollowsTheSimpleMappings) {
