@@ -4,6 +4,7 @@
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/StoredError.h"
 #include "tests/support/compound/CompoundTree.h"
+#include "tests/support/compound/GsfFile.h"
 #include "tests/unit/aaf_library/limits/SmallLimits.h"
 
 #include <gtest/gtest.h>
@@ -111,6 +112,7 @@ TEST_P(CompoundFileLimitsOf, NothingLiesInTheSectorThatIsLocked) {
         const Bytes file = compound::Written(root, GetParam());
         ASSERT_EQ(file.size(), whole.size() + Sector());
         EXPECT_EQ(compound::Difference(compound::Read(file), root), "");
+        EXPECT_EQ(compound::Difference(gsf::Read(file), root), "");
         const auto locked = file.begin() + static_cast<std::ptrdiff_t>((sector + 1) * Sector());
         EXPECT_EQ(Bytes(locked, locked + static_cast<std::ptrdiff_t>(Sector())), Bytes(Sector()));
         const std::size_t perTable = Sector() / 4;
@@ -140,6 +142,7 @@ TEST(CompoundFileLimits, TheLockedSectorMayLieAmongTablesAndTheirList) {
         const Bytes file = compound::Written(root, SectorSize::Bytes512);
         EXPECT_EQ(file.size(), whole.size() + 512);
         EXPECT_EQ(compound::Difference(compound::Read(file), root), "");
+        EXPECT_EQ(compound::Difference(gsf::Read(file), root), "");
     }
 }
 
@@ -155,6 +158,7 @@ TEST(CompoundFileLimits, TheLockedSectorHasItsEntryInTheTable) {
         const std::size_t described = NumberIn(file.data() + kTableCountOffset) * std::size_t{128};
         EXPECT_GE(described, file.size() / 512 - 1);
         EXPECT_EQ(compound::Difference(compound::Read(file), root), "");
+        EXPECT_EQ(compound::Difference(gsf::Read(file), root), "");
     }
 }
 

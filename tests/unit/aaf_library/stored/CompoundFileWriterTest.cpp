@@ -309,6 +309,11 @@ TEST(CompoundFileWriter, RefusesNamesThatNoEntryCanHold) {
 TEST(CompoundFileWriter, RefusesANameTwiceInOneStorage) {
     EXPECT_EQ(Refusal(u"name", u"name"), "\"name\" is twice in one storage");
     EXPECT_EQ(Refusal(u"name", u"Name"), "\"Name\" is twice in one storage");
+    EXPECT_EQ(Refusal(u"\u00C9t\u00E9", u"\u00E9T\u00C9"),
+              "\"\xC3\xA9T\xC3\x89\" is twice in one storage");
+    EXPECT_NE(Refusal(u"\u03C9", u"\u03A9"), "") << "Greek";
+    EXPECT_NE(Refusal(u"\u01C6", u"\u01C5"), "") << "one that has a form for titles";
+    EXPECT_EQ(Refusal(u"\u00DF", u"SS"), "") << "a letter has one capital or none";
     CompoundFileWriter writer(SectorSize::Bytes512);
     writer.AddStream(writer.AddStorage(kRoot, u"name"), u"name", {});
     EXPECT_NO_THROW(writer.Finish());
