@@ -55,8 +55,8 @@ CompoundFileWriter::CompoundFileWriter(SectorSize sectorSize)
     : sectorSize_(static_cast<std::size_t>(sectorSize)),
       lockSector_(LockSector(sectorSize)),
       large_(sectorSize == SectorSize::Bytes4096),
-      file_(sectorSize_) {
-    std::uint8_t* const header = file_.data();
+      pieces_{Bytes(sectorSize_)} {
+    std::uint8_t* const header = pieces_.front().data();
     std::copy(std::begin(kCompoundMagic), std::end(kCompoundMagic), header);
     const StoredAuid& signature = large_ ? kSignature4096 : kSignature512;
     std::copy(signature.begin(), signature.end(), header + kSignatureOffset);
@@ -135,22 +135,22 @@ std::vector<Bytes> CompoundFileWriter::FinishPieces() {
     SetHeader(kDirectoryCountOffset, large_ ? directory.size() / sectorSize_ : 0);
     Bytes table = Table();
     FillUp(small_, sectorSize_);
-    std::vector<Bytes> pieces;
-    for (Bytes* const piece : {&file_, &small_, &smallTable, &directory, &table}) {
-        pieces.push_back(std::move(*piece));
+    for (Bytes* const piece : {&small_, &smallTable, &directory, &table}) {
+        pieces_.push_back(std::move(*piece));
     }
     if (lockSector_ != kFreeSector) {
-        OpenGap(pieces, (lockSector_ + std::size_t{1}) * sectorSize_, sectorSize_);
+        OpenGap(pieces_, (lockSector_ + std::size_t{1}) * sectorSize_, sectorSize_);
     }
-    return pieces;
+    return std::move(pieces_);
 }
 
 void CompoundFileWriter::SetHeader(std::size_t offset, std::size_t value) {
-    PutNumber(file_.data() + offset, static_cast<std::uint32_t>(value));
+    PutNumber(pieces_.front().data() + offset, static_cast<std::uint32_t>(value));
 }
 
 std::uint64_t CompoundFileWriter::BytesSoFar() {
-    return std::uint64_t{file_.size()} + small_.size() + directory_.bytes().size();
+    return (std::uint64_t{table_.size()} + 1) * sectorSize_ + small_.size() +
+           directory_.bytes().size();
 }
 
 void CompoundFileWriter::CheckSize(std::uint64_t size) const {
@@ -191,9 +191,20 @@ std::uint32_t CompoundFileWriter::NumberSectors(std::size_t size) {
     return chain.front();
 }
 
+// Pieces grow with the file up to a mebibyte, and nothing in them is moved.
+Bytes& CompoundFileWriter::PieceWithRoomFor(std::size_t size) {
+    const Bytes& last = pieces_.back();
+    if (last.capacity() - last.size() < size) {
+        constexpr std::size_t most = 1 << 20;
+        pieces_.emplace_back().reserve(std::max(size, std::min(most, table_.size() * sectorSize_)));
+    }
+    return pieces_.back();
+}
+
 std::uint32_t CompoundFileWriter::AppendSectors(const Bytes& content) {
-    file_.insert(file_.end(), content.begin(), content.end());
-    FillUp(file_, sectorSize_);
+    Bytes& piece = PieceWithRoomFor(CountOf(content.size(), sectorSize_) * sectorSize_);
+    piece.insert(piece.end(), content.begin(), content.end());
+    FillUp(piece, sectorSize_);
     return NumberSectors(content.size());
 }
 
@@ -257,7 +268,7 @@ Bytes CompoundFileWriter::Table() {
     Bytes table = NumberBytes(table_);
     const Bytes listed = NumberBytes(list);
     const auto behindHeader = listed.begin() + kHeaderTableCount * 4;
-    std::copy(listed.begin(), behindHeader, file_.begin() + kTableListOffset);
+    std::copy(listed.begin(), behindHeader, pieces_.front().begin() + kTableListOffset);
     table.insert(table.end(), behindHeader, listed.end());
     return table;
 }

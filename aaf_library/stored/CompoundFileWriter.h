@@ -53,6 +53,7 @@ private:
     void CheckSize(std::uint64_t size) const;
     std::vector<std::uint32_t> TakeSectors(std::size_t count, std::uint32_t mark);
     std::uint32_t NumberSectors(std::size_t size);
+    Bytes& PieceWithRoomFor(std::size_t size);
     std::uint32_t AppendSectors(const Bytes& content);
     std::uint32_t AppendSmallSectors(const Bytes& content);
     Bytes SmallTable();
@@ -61,7 +62,7 @@ private:
     const std::size_t sectorSize_;
     const std::uint32_t lockSector_;
     const bool large_;
-    Bytes file_;
+    std::vector<Bytes> pieces_;         // the header, then the long streams
     std::vector<std::uint32_t> table_;  // the sector after each sector
     Bytes small_;                       // the short streams
     std::vector<std::uint32_t> smallTable_;
