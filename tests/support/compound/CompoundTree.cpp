@@ -109,6 +109,12 @@ Bytes Written(const Node& root, SectorSize sectorSize) {
     return writer.Finish();
 }
 
+std::vector<Bytes> WrittenInPieces(const Node& root, SectorSize sectorSize) {
+    CompoundFileWriter writer(sectorSize);
+    Add(writer, CompoundFileWriter::kRoot, root);
+    return writer.FinishPieces();
+}
+
 Node Read(const Bytes& file) {
     CompoundFileReader reader(file);
     return NodeOf(reader, CompoundFileReader::kRootIndex);

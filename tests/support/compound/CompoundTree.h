@@ -31,6 +31,7 @@ Bytes Content(std::size_t size);
 
 // By the library's own writer and reader. They throw StoredError.
 Bytes Written(const Node& root, SectorSize sectorSize);
+std::vector<Bytes> WrittenInPieces(const Node& root, SectorSize sectorSize);
 Node Read(const Bytes& file);
 
 // Where two trees differ, as a sentence; empty when they are equal. The order of nodes does not

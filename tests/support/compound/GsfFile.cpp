@@ -95,22 +95,36 @@ Node NodeOf(GsfInput* input, const std::u16string& name) {
     return node;
 }
 
-void Write(GsfOutfile* storage, const Node& node) {
+void Write(GsfOutfile* storage, const Named& named) {
     const compound::StoredAuid none{};
-    if (node.classId != none) {
-        gsf_outfile_msole_set_class_id(GSF_OUTFILE_MSOLE(storage), node.classId.data());
+    if (named.node.classId != none) {
+        gsf_outfile_msole_set_class_id(GSF_OUTFILE_MSOLE(storage), named.node.classId.data());
     }
-    for (const Node& contained : node.nodes) {
+    for (const Named& contained : named.nodes) {
+        const Node& node = contained.node;
         const Held<GsfOutput> output =
-            Hold(gsf_outfile_new_child(storage, Utf8(contained.name).c_str(), contained.isStorage),
+            Hold(gsf_outfile_new_child(storage, contained.name.c_str(), node.isStorage),
                  "a storage or stream that can't be made");
-        if (contained.isStorage) {
+        if (node.isStorage) {
             Write(GSF_OUTFILE(output.get()), contained);
         } else {
-            gsf_output_write(output.get(), contained.content.size(), contained.content.data());
+            gsf_output_write(output.get(), node.content.size(), node.content.data());
         }
         gsf_output_close(output.get());
     }
+}
+
+Held<GsfOutput> InMemory(const Named& root, compound::SectorSize sectorSize) {
+    SetUp();
+    Held<GsfOutput> sink = Hold(gsf_output_memory_new(), "no memory");
+    const Held<GsfOutfile> outfile =
+        Hold(gsf_outfile_msole_new_full(sink.get(), static_cast<guint>(sectorSize), 64),
+             "no file can be made");
+    Write(outfile.get(), root);
+    if (!gsf_output_close(GSF_OUTPUT(outfile.get()))) {
+        throw std::runtime_error("libgsf: the file can't be written");
+    }
+    return sink;
 }
 
 }  // namespace
@@ -126,19 +140,16 @@ Node Read(const Bytes& file) {
 }
 
 Bytes Written(const Node& root, compound::SectorSize sectorSize) {
-    SetUp();
-    const Held<GsfOutput> sink = Hold(gsf_output_memory_new(), "no memory");
-    {
-        const Held<GsfOutfile> outfile =
-            Hold(gsf_outfile_msole_new_full(sink.get(), static_cast<guint>(sectorSize), 64),
-                 "no file can be made");
-        Write(outfile.get(), root);
-        if (!gsf_output_close(GSF_OUTPUT(outfile.get()))) {
-            throw std::runtime_error("libgsf: the file can't be written");
-        }
-    }
+    const Held<GsfOutput> sink = InMemory(Named(root), sectorSize);
     const guint8* const bytes = gsf_output_memory_get_bytes(GSF_OUTPUT_MEMORY(sink.get()));
     return {bytes, bytes + gsf_output_size(sink.get())};
+}
+
+Named::Named(const Node& wanted)
+    : node(wanted), name(Utf8(wanted.name)), nodes(wanted.nodes.begin(), wanted.nodes.end()) {}
+
+std::size_t SizeWritten(const Named& root, compound::SectorSize sectorSize) {
+    return static_cast<std::size_t>(gsf_output_size(InMemory(root, sectorSize).get()));
 }
 
 }  // namespace gsf

@@ -12,4 +12,15 @@ namespace gsf {
 compound::Node Read(const compound::Bytes& file);
 compound::Bytes Written(const compound::Node& root, compound::SectorSize sectorSize);
 
+// A tree with its names as libgsf takes them. It refers to the nodes.
+struct Named {
+    explicit Named(const compound::Node& wanted);
+
+    const compound::Node& node;
+    std::string name;
+    std::vector<Named> nodes;
+};
+// Writes into memory; gives the size of the file.
+std::size_t SizeWritten(const Named& root, compound::SectorSize sectorSize);
+
 }  // namespace gsf
