@@ -37,6 +37,7 @@ constexpr FailureCode kFailureCodes[] = {
     {stored::FileFailure::NotAaf, AAFRESULT_NOT_AAF_FILE},
     {stored::FileFailure::Damaged, AAFRESULT_READ_FAILURE},
     {stored::FileFailure::NotStorable, AAFRESULT_INVALID_OBJ},
+    {stored::FileFailure::TooLarge, AAFRESULT_DATA_SIZE},
     {stored::FileFailure::NoMemory, AAFRESULT_NOMEMORY},
 };
 

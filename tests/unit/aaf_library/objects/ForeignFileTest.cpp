@@ -17,6 +17,7 @@
 #include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/objects/ClipDescription.h"
+#include "tests/unit/aaf_library/objects/Sentences.h"
 
 namespace aaf_test {
 
@@ -27,24 +28,6 @@ using aaf::stored::StoredProperty;
 namespace prop = aaf::prop;
 
 namespace {
-
-// Sentences that the library tells while this lives.
-class Sentences final : public IAAFDiagnosticOutput {
-public:
-    Sentences() { AAFSetDiagnosticOutput(this); }
-    ~Sentences() { AAFSetDiagnosticOutput(nullptr); }
-    Sentences(const Sentences&) = delete;
-    Sentences& operator=(const Sentences&) = delete;
-    HRESULT QueryInterface(REFIID, void**) override { return AAFRESULT_NOT_IMPLEMENTED; }
-    ULONG AddRef() override { return 1; }
-    ULONG Release() override { return 1; }
-    HRESULT PutString(aafCharacter_constptr sentence) override {
-        all.emplace_back(sentence);
-        return AAFRESULT_SUCCESS;
-    }
-
-    std::vector<std::wstring> all;
-};
 
 StoredProperty& PropertyIn(StoredObject& object, aaf::PropertyId pid) {
     for (StoredProperty& property : object.properties) {
