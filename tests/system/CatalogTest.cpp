@@ -558,6 +558,8 @@ TEST_F(Catalogs, WaitForALockAndThenSaySo) {
         Database other(folder() / "c.sqlite", Database::Access::Change);
         other.Run("BEGIN IMMEDIATE");
         EXPECT_EQ(Run("find c.sqlite").status, 0);
+        // Nor an update that has nothing to write.
+        ExpectSays(Run("catalog in -o c.sqlite --update"), 0, "0 catalogued, 0 not, 1 as before");
         Copy("png.mov", "in/b.mov");
         ExpectSays(Run("catalog in -o c.sqlite --update"), 2, "another program has kept it locked");
     }
