@@ -85,7 +85,7 @@ const TreeNode* LeadingSlot(const TreeNode& mob) {
     return picture != slots.end() ? &*picture : slots.empty() ? nullptr : &slots.front();
 }
 
-constexpr char kMasterMob[] = "MasterMob";
+constexpr char kMasterMobClass[] = "MasterMob";
 
 // The mob whose descriptor has this class, or which has the class itself. A tape may be among them.
 const TreeNode* MobOf(const TreeNode& description, std::string_view name) {
@@ -250,7 +250,7 @@ Entry EntryOf(const Description& description, CodecReader& codecs) {
     movie["route"] = taken.route;
     Set(movie, "route_reason", taken.reason);
     const TreeNode tree = ReadTree(description.file.get());
-    const TreeNode* const master = MobOf(tree, kMasterMob);
+    const TreeNode* const master = MobOf(tree, kMasterMobClass);
     const TreeNode* const file = MobOf(tree, "MultipleDescriptor");
     const TreeNode* const source = MobOf(tree, "ImportDescriptor");
     if (!master || !file || !source) {
