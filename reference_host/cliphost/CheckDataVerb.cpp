@@ -129,7 +129,8 @@ void AddCheckData(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {
         const std::filesystem::path folder =
-            options->folder.empty() ? ModuleFile(session).parent_path() : options->folder;
+            options->folder.empty() ? std::filesystem::absolute(ModuleFile(session)).parent_path()
+                                    : options->folder;
         AnswerFailureToo(options->json, schema::kCheckData, {{"folder", MachinePath(folder)}}, [&] {
             status = CheckDataFiles(folder, options->json, session.verbosity);
         });

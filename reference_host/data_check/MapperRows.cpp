@@ -9,7 +9,7 @@ namespace {
 
 constexpr std::size_t kLengthOfCode = 4;
 constexpr char kHintForCode[] = "write the four characters of the code; blanks count";
-constexpr NumberRule kId = {"vcid", [](std::uint32_t id) { return id != 0; },
+constexpr NumberRule kVcid = {"vcid", [](std::uint32_t id) { return id != 0; },
                             "a whole number above 0, or leave it out", false};
 
 std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryReader& reader,
@@ -37,7 +37,7 @@ std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryRe
         }
         row.vendor = vendor ? vendor->value.substr(0, kLengthOfCode) : "";
     }
-    row.id = reader.Number(entry, kId).value_or(0);
+    row.id = reader.Number(entry, kVcid).value_or(0);
     return findings.count() == before ? std::optional<MapperRow>(row) : std::nullopt;
 }
 
