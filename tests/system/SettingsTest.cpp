@@ -234,7 +234,8 @@ TEST_F(SettingsFile, TakesEveryOptionOfEveryVerb) {
     std::size_t options = 0;
     for (const char* const verb :
          {"", "scan", "describe", "samples", "formats", "frame", "contact", "audio", "dump",
-          "verify", "relink", "types", "params", "plugin", "catalog", "find"}) {
+          "compare", "verify", "relink", "types", "params", "plugin", "check-data", "catalog",
+          "find"}) {
         for (const std::string& name : OptionsOf(verb)) {
             if (none.count(name) == 0) {
                 ++options;
