@@ -33,7 +33,8 @@ public:
         for (const host::Ref<IAAFMob>& mob : MobsOf(file)) {
             aafMobID_t id{};
             mob->GetMobID(&id);
-            Add(mob.get(), ToText(id), TextOf(mob.get(), &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
+            Add(mob.get(), ToText(id),
+                TextOf(mob.get(), &IAAFMob::GetNameBufLen, &IAAFMob::GetName));
         }
         std::stable_sort(entries_.begin(), entries_.end(), [](const Entry& a, const Entry& b) {
             return a.about.name < b.about.name;

@@ -21,7 +21,7 @@ namespace cliphost {
 
 namespace {
 
-constexpr aafUInt32 kMostElements = 64;  // of an array shown on one line
+constexpr aafUInt32 kMostElements = 64;         // of an array shown on one line
 constexpr std::size_t kMostOfStream = 0x10000;  // that is read at once
 constexpr std::size_t kMostOfRest = 0x10000;    // that is kept before it is digested
 

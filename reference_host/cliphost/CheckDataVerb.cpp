@@ -71,8 +71,7 @@ void PrintFindings(const CheckedData& checked, const std::filesystem::path& fold
     for (const Finding& finding : checked.findings) {
         const std::filesystem::path file = FileOf(folder, static_cast<std::size_t>(finding.file));
         fmt::print("{}:{}:{}: {}\n", host::DisplayPath(file), finding.place.line,
-                   finding.place.column,
-                   host::text::Printable(finding.what + "; " + finding.hint));
+                   finding.place.column, host::text::Printable(finding.what + "; " + finding.hint));
     }
     const data_check::DataCounts& counts = checked.counts;
     if (counts.findings > checked.findings.size()) {
@@ -110,8 +109,9 @@ int CheckDataFiles(const std::filesystem::path& folder, bool json, int verbosity
 
 void AddCheckData(CLI::App& app, const SessionOptions& session, int& status) {
     auto* const verb = app.add_subcommand(
-        "check-data", "Look for mistakes in the module's two data files, such as in rows that you "
-                      "added");
+        "check-data",
+        "Look for mistakes in the module's two data files, such as in rows that you "
+        "added");
     verb->footer(
         "Examples:\n"
         "  cliphost check-data                       # the files that are in use\n"

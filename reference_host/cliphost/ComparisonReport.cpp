@@ -81,9 +81,12 @@ ordered_json ToJson(const ComparedObject& object, const TreeDifference& differen
 }
 
 ordered_json ToJson(const ComparisonCounts& counts) {
-    return {{"differences", counts.differences}, {"alike", counts.alike},
-            {"changed", counts.changed},         {"gone", counts.gone},
-            {"new", counts.added},               {"unread", counts.unread}};
+    return {{"differences", counts.differences},
+            {"alike", counts.alike},
+            {"changed", counts.changed},
+            {"gone", counts.gone},
+            {"new", counts.added},
+            {"unread", counts.unread}};
 }
 
 int StatusOf(const ComparisonCounts& counts) {

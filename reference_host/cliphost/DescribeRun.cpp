@@ -319,15 +319,15 @@ void DescribeRun::TellDifferences() {
     }
     ordered_json differences = ordered_json::array();
     ComparisonLines lines;
-    const ComparisonCounts counts = CompareFiles(
-        against_.get(), bin_->file(),
-        [&](const ComparedObject& object, const TreeDifference& difference) {
-            if (options_.form.json) {
-                differences.push_back(ToJson(object, difference));
-            } else {
-                lines.Take(object, difference);
-            }
-        });
+    const ComparisonCounts counts =
+        CompareFiles(against_.get(), bin_->file(),
+                     [&](const ComparedObject& object, const TreeDifference& difference) {
+                         if (options_.form.json) {
+                             differences.push_back(ToJson(object, difference));
+                         } else {
+                             lines.Take(object, difference);
+                         }
+                     });
     CountStatus(StatusOf(counts));
     if (options_.form.json) {
         AddEntry({{"against", MachinePath(file)},

@@ -47,9 +47,9 @@ private:
     void AddEntry(const nlohmann::ordered_json& head, const std::string& description);
 
     const DescribeOptions& options_;
-    PathMaps maps_;  // to know which were used
-    std::optional<Bin> bin_;       // of what is made of all
-    host::Ref<IAAFFile> against_;  // empty: nothing is compared
+    PathMaps maps_;                 // to know which were used
+    std::optional<Bin> bin_;        // of what is made of all
+    host::Ref<IAAFFile> against_;   // empty: nothing is compared
     std::filesystem::path copyOf_;  // what the last movie that went into the bin is a copy of
     std::map<const MovieColumns::Row*, std::string> movieOfRow_;
     std::vector<std::pair<std::filesystem::path::string_type, ColumnValues>> columns_;

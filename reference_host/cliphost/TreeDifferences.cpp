@@ -73,7 +73,7 @@ std::string KindOfSlot(const TreeNode& slot) {
 
 // "first", "second", "11th"
 std::string Ordinal(std::size_t number) {
-    constexpr const char* kFirst[] = {"first", "second", "third",   "fourth", "fifth",
+    constexpr const char* kFirst[] = {"first", "second",  "third",  "fourth", "fifth",
                                       "sixth", "seventh", "eighth", "ninth",  "tenth"};
     if (number <= std::size(kFirst)) {
         return kFirst[number - 1];
@@ -261,9 +261,9 @@ std::string InWords(const TreeDifference& difference) {
         case Kind::Changed:
             break;
     }
-    return fmt::format("{}{}{} {}", text, text.empty() ? "" : ": ",
-                       PropertyWords(difference.property),
-                       Shown(difference.before.value_or("none"), difference.after.value_or("none")));
+    return fmt::format(
+        "{}{}{} {}", text, text.empty() ? "" : ": ", PropertyWords(difference.property),
+        Shown(difference.before.value_or("none"), difference.after.value_or("none")));
 }
 
 void TreeComparison::Tell(TreeDifference difference) {

@@ -15,9 +15,9 @@ struct Raster {
 
 // The nine rasters of these codes, and the id of each.
 constexpr std::size_t kShared = 9;
-constexpr Raster kSharedRasters[kShared] = {
-    {720, 240, 1}, {720, 243, 1},  {720, 288, 1},  {720, 480, 0},  {720, 486, 0},
-    {720, 576, 0}, {1280, 720, 0}, {1920, 540, 1}, {1920, 1080, 0}};
+constexpr Raster kSharedRasters[kShared] = {{720, 240, 1},  {720, 243, 1},  {720, 288, 1},
+                                            {720, 480, 0},  {720, 486, 0},  {720, 576, 0},
+                                            {1280, 720, 0}, {1920, 540, 1}, {1920, 1080, 0}};
 struct IdsOfCode {
     std::string_view code;
     std::uint32_t ids[kShared];

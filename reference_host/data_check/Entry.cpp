@@ -17,10 +17,10 @@ using host::PlacedElement;
 // Its blanks count.
 constexpr std::string_view kCode = "FourChar";
 
-constexpr std::size_t kLongestNumber = 9;    // in digits; one of 32 bits takes it
-constexpr std::size_t kLongestShown = 60;    // of a value or name
+constexpr std::size_t kLongestNumber = 9;     // in digits; one of 32 bits takes it
+constexpr std::size_t kLongestShown = 60;     // of a value or name
 constexpr std::size_t kLongestCompared = 64;  // of names
-constexpr std::size_t kLikeness = 2;         // letters in which a mistyped name may differ
+constexpr std::size_t kLikeness = 2;          // letters in which a mistyped name may differ
 
 bool HasOuterBlank(const std::string& text) {
     constexpr const char* kBlanks = " \t\r\n";
@@ -89,10 +89,10 @@ std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
 std::optional<std::uint32_t> NumberIn(const std::string& text) {
     std::uint32_t number = 0;
     const char* const end = text.data() + text.size();
-    const bool isPlain = !text.empty() && text.size() <= kLongestNumber &&
-                         std::all_of(text.begin(), text.end(),
-                                     [](char c) { return c >= '0' && c <= '9'; }) &&
-                         (text.size() == 1 || text[0] != '0');
+    const bool isPlain =
+        !text.empty() && text.size() <= kLongestNumber &&
+        std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; }) &&
+        (text.size() == 1 || text[0] != '0');
     return isPlain && std::from_chars(text.data(), end, number).ptr == end
                ? std::optional<std::uint32_t>(number)
                : std::nullopt;
@@ -162,8 +162,9 @@ void EntryReader::CheckBlanks(const PlacedElement& element) const {
     const auto check = [&](const std::string& name, const std::string& value,
                            host::XmlPlace place) {
         if (name != kCode && HasOuterBlank(value)) {
-            Tell(place, fmt::format("{} is empty or has blanks around it", name),
-                 "write the value with nothing around it; the module takes blanks for a part of it");
+            Tell(
+                place, fmt::format("{} is empty or has blanks around it", name),
+                "write the value with nothing around it; the module takes blanks for a part of it");
         }
     };
     for (const PlacedAttribute& attribute : element.attributes) {

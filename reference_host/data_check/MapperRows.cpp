@@ -10,7 +10,7 @@ namespace {
 constexpr std::size_t kLengthOfCode = 4;
 constexpr char kHintForCode[] = "write the four characters of the code; blanks count";
 constexpr NumberRule kVcid = {"vcid", [](std::uint32_t id) { return id != 0; },
-                            "a whole number above 0, or leave it out", false};
+                              "a whole number above 0, or leave it out", false};
 
 std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryReader& reader,
                                  Findings& findings) {
@@ -30,10 +30,10 @@ std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryRe
     if (!ItemsOf(entry, "Vendor").empty()) {
         const std::optional<Item> vendor = reader.One(entry, "Vendor", "");
         if (vendor && vendor->value.size() > kLengthOfCode) {
-            reader.Tell(vendor->place,
-                        fmt::format("of Vendor only \"{}\" counts",
-                                    vendor->value.substr(0, kLengthOfCode)),
-                        "write the four characters that movies have");
+            reader.Tell(
+                vendor->place,
+                fmt::format("of Vendor only \"{}\" counts", vendor->value.substr(0, kLengthOfCode)),
+                "write the four characters that movies have");
         }
         row.vendor = vendor ? vendor->value.substr(0, kLengthOfCode) : "";
     }

@@ -36,8 +36,8 @@ constexpr NumberRule kCommon[] = {
 constexpr NumberRule kCdci[] = {
     {"rp210:ComponentDepth", [](std::uint32_t n) { return n >= 1 && n <= 16; }, "1 to 16 bits",
      true},
-    {"rp210:HorizontalSubsampling",
-     [](std::uint32_t n) { return n == 1 || n == 2 || n == 4; }, "1, 2 or 4", true},
+    {"rp210:HorizontalSubsampling", [](std::uint32_t n) { return n == 1 || n == 2 || n == 4; },
+     "1, 2 or 4", true},
     {"rp210:VerticalSubsampling", [](std::uint32_t n) { return n == 1 || n == 2; }, "1 or 2", true},
     {"rp210:ColorSiting", [](std::uint32_t n) { return n <= 4 || n == 255; }, "0 to 4, or 255",
      true},
@@ -217,10 +217,9 @@ private:
         }
         for (std::size_t i = kDigits / 2; i < kDigits; i += 2) {
             if (digits[i] > '7') {
-                reader_.Tell(
-                    item->place,
-                    fmt::format("{} has a byte of 80h or more in its second half", name),
-                    "take another label; the module spoils this one");
+                reader_.Tell(item->place,
+                             fmt::format("{} has a byte of 80h or more in its second half", name),
+                             "take another label; the module spoils this one");
                 return;
             }
         }

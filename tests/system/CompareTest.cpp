@@ -61,8 +61,7 @@ protected:
             }
         };
         walk(root);
-        ASSERT_TRUE(
-            aaf::stored::SaveTree(root, folder() / to, aaf::stored::SectorSize::Bytes512));
+        ASSERT_TRUE(aaf::stored::SaveTree(root, folder() / to, aaf::stored::SectorSize::Bytes512));
     }
 };
 
@@ -79,8 +78,8 @@ TEST_F(CompareVerb, FindsNothingBetweenTwoDescriptionsOfAMovie) {
 
 TEST_F(CompareVerb, NeedsNoModule) {
     Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
-    EXPECT_EQ(RunCliphost("--plugin /nowhere.nvx compare " + In("a.aaf") + " " + In("a.aaf")).status,
-              0);
+    EXPECT_EQ(
+        RunCliphost("--plugin /nowhere.nvx compare " + In("a.aaf") + " " + In("a.aaf")).status, 0);
 }
 
 // Another content is another mob, which is known by its name.
@@ -113,8 +112,8 @@ TEST_F(CompareVerb, TellsWhatCameIntoABinAndWhatWent) {
 TEST_F(CompareVerb, AnswersInJson) {
     const std::string movie = Movie("in/a.mov", 10);
     Describe(movie, "--aaf " + In("a.aaf"));
-    Describe(movie, "--aaf " + In("b.aaf") + " --map " +
-                        Quoted((folder() / "in").string() + "=/nowhere"));
+    Describe(movie,
+             "--aaf " + In("b.aaf") + " --map " + Quoted((folder() / "in").string() + "=/nowhere"));
     const CommandResult compared = Answer("compare --json " + In("a.aaf") + " " + In("b.aaf"));
     EXPECT_EQ(compared.status, 1);
     const Json answer = Json::parse(compared.out);
@@ -212,14 +211,14 @@ TEST_F(DescribeAgainst, TellsOfABinWhateverTheJobs) {
     Movie("in/b.mov", 11);
     Describe(In("in"), "--bin " + In("old.aaf"));
     for (const char* const jobs : {"1", "2"}) {
-        const std::string call = "describe " + In("in") + " --against " + In("old.aaf") +
-                                 " --jobs " + std::string(jobs);
+        const std::string call =
+            "describe " + In("in") + " --against " + In("old.aaf") + " --jobs " + std::string(jobs);
         ExpectSays(RunCliphost(call), 0, "no differences: 6 mobs alike\n");
     }
     Movie("in/b.mov", 12);
     for (const char* const jobs : {"1", "2"}) {
-        const std::string call = "describe " + In("in") + " --against " + In("old.aaf") +
-                                 " --jobs " + std::string(jobs);
+        const std::string call =
+            "describe " + In("in") + " --against " + In("old.aaf") + " --jobs " + std::string(jobs);
         const CommandResult compared = RunCliphost(call);
         ExpectSays(compared, 1, "picture slot 3: length 11 -> 12\n");
         ExpectSays(compared, 1, ": 3 mobs alike, 3 mobs changed\n");

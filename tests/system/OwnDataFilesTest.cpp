@@ -134,8 +134,7 @@ TEST_F(AddedCodec, IsFineAndChangesTheDescriptionOfItsMovies) {
         RunCliphost(CliphostWithCopy() + "describe " + movie + " --against " + old);
     ExpectSays(told, 1, "-> {04010202-0301-0100-060E-2B3404010107}\n");
     ExpectSays(told, 1, "file descriptors: compression ");
-    ExpectSays(
-        RunCliphost(CliphostWithCopy() + "check-data"), 0, "no findings: ");
+    ExpectSays(RunCliphost(CliphostWithCopy() + "check-data"), 0, "no findings: ");
 }
 
 TEST_F(AddedCodec, IsToldWithItsPlaceWhereItHasAMistake) {
@@ -143,7 +142,8 @@ TEST_F(AddedCodec, IsToldWithItsPlaceWhereItHasAMistake) {
     Replace("AAFInfo.xml", "rp210:ColorSiting=\"0\"", "rp210:ColorSiting=\"9\"");
     const std::string text = TextOf(Place("AAFInfo.xml"));
     const std::size_t at = text.find("rp210:ColorSiting=\"9\"");
-    const auto line = std::count(text.begin(), text.begin() + static_cast<std::ptrdiff_t>(at), '\n') + 1;
+    const auto line =
+        std::count(text.begin(), text.begin() + static_cast<std::ptrdiff_t>(at), '\n') + 1;
     const std::size_t column = at - text.rfind('\n', at);
     ExpectSays(CheckData(), 1,
                "AAFInfo.xml:" + std::to_string(line) + ":" + std::to_string(column) +
@@ -153,7 +153,8 @@ TEST_F(AddedCodec, IsToldWithItsPlaceWhereItHasAMistake) {
 TEST_F(AddedCodec, IsToldWhereItsIdLeadsNowhere) {
     Add();
     Replace("FourCharMapper.xml", "10800", "10801");
-    ExpectSays(CheckData(), 1, "code \"mjp2\" leads to id 10801, which has no record; add a record");
+    ExpectSays(CheckData(), 1,
+               "code \"mjp2\" leads to id 10801, which has no record; add a record");
     ExpectSays(CheckData(), 1, ": no code leads to id 10800; add a row with vcid 10800");
 }
 
@@ -162,7 +163,8 @@ TEST_F(AddedCodec, IsToldWhereItBreaksTheFile) {
     ExpectSays(CheckData(), 1, ": this is no well-formed XML: mismatched tag; correct it");
     // What a description says then leads to the same place.
     const std::string movie = Quoted(Write(FullFrame("v210", 25, 1)));
-    ExpectSays(RunCliphost(CliphostWithCopy() + "describe " + movie), 2, "AAFInfo.xml: this data file");
+    ExpectSays(RunCliphost(CliphostWithCopy() + "describe " + movie), 2,
+               "AAFInfo.xml: this data file");
 }
 
 TEST_F(AddedCodec, IsLookedForInAFolderThatHasBothFiles) {

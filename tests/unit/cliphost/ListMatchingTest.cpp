@@ -44,9 +44,9 @@ TEST(ListMatching, NeverTakesOneKindForAnother) {
 }
 
 TEST(ListMatching, LeavesTheRestAsItIsWhereOneWasPutIn) {
-    EXPECT_EQ(MatchLists({Loose(1), Loose(2), Loose(3)}, {Loose(1), Loose(9), Loose(2), Loose(3)},
-                         false),
-              (Places{0, 2, 3}));
+    EXPECT_EQ(
+        MatchLists({Loose(1), Loose(2), Loose(3)}, {Loose(1), Loose(9), Loose(2), Loose(3)}, false),
+        (Places{0, 2, 3}));
     EXPECT_EQ(MatchLists({Loose(1), Loose(2), Loose(3)}, {Loose(1), Loose(3)}, false),
               (Places{0, kNone, 1}));
 }

@@ -58,8 +58,9 @@ TreeNode Part(const std::string& title, const std::string& length) {
 
 Texts Differences(const TreeNode& before, const TreeNode& after) {
     Texts texts;
-    TreeComparison([&](const TreeDifference& one) { texts.push_back(InWords(one)); })
-        .Compare(before, after);
+    TreeComparison([&](const TreeDifference& one) {
+        texts.push_back(InWords(one));
+    }).Compare(before, after);
     return texts;
 }
 
@@ -82,8 +83,9 @@ TEST(TreeDifferences, TellWhatOneAloneHas) {
 }
 
 TEST(TreeDifferences, TellAnInsertedSlotAloneAndNotThoseBehindIt) {
-    EXPECT_EQ(Differences(Mob({Picture("1"), Sound("2")}), Mob({Picture("1"), Sound("5"), Sound("2")})),
-              Texts{"first sound slot (5) new"});
+    EXPECT_EQ(
+        Differences(Mob({Picture("1"), Sound("2")}), Mob({Picture("1"), Sound("5"), Sound("2")})),
+        Texts{"first sound slot (5) new"});
 }
 
 TEST(TreeDifferences, CountSlotsOfOneKind) {
@@ -135,8 +137,9 @@ TEST(TreeDifferences, TellAnotherClassAndNotWhatIsInIt) {
 }
 
 TEST(TreeDifferences, AreNotWhatSaysWhenAFileWasWritten) {
-    EXPECT_EQ(Differences(Node("Mob", {{"CreationTime", "1"}, {"Generation", "2"}, {"LastModified", "3"}}),
-                          Node("Mob", {{"CreationTime", "4"}, {"LastModified", "5"}})),
+    EXPECT_EQ(Differences(
+                  Node("Mob", {{"CreationTime", "1"}, {"Generation", "2"}, {"LastModified", "3"}}),
+                  Node("Mob", {{"CreationTime", "4"}, {"LastModified", "5"}})),
               Texts{});
     // Nor do they keep a part from being found.
     const auto part = [](const std::string& time) {
@@ -168,8 +171,9 @@ TEST(TreeDifferences, CountWhatNothingCanBeSaidOf) {
 }
 
 TEST(TreeDifferences, TakePropertiesThatAreValuesInOneAndObjectsInTheOther) {
-    EXPECT_EQ(Differences(Node("Mob", {{"X", "1"}}), Node("Mob", {}, {{"X", {Part("Filler", "1")}}})),
-              (Texts{"x 1 -> none", "first x (Filler) new (length 1)"}));
+    EXPECT_EQ(
+        Differences(Node("Mob", {{"X", "1"}}), Node("Mob", {}, {{"X", {Part("Filler", "1")}}})),
+        (Texts{"x 1 -> none", "first x (Filler) new (length 1)"}));
 }
 
 TEST(TreeDifferences, TakeNamesThatAreThereTwice) {

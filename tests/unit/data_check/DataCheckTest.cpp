@@ -84,8 +84,7 @@ protected:
         return data_check::CheckData(folder_.path());
     }
     Texts Check(const std::string& records, const std::string& rows = Row("dvc ", "vcid='10000'")) {
-        return TextsOf(
-            CheckFiles("<Map>\n" + rows + "</Map>", "<Infos>\n" + records + "</Infos>"));
+        return TextsOf(CheckFiles("<Map>\n" + rows + "</Map>", "<Infos>\n" + records + "</Infos>"));
     }
     const TestFolder folder_;
 };
@@ -105,11 +104,10 @@ TEST_F(DataChecks, FindNothingInAGoodPair) {
 }
 
 TEST_F(DataChecks, TellWhereAMistakeIsAndWhatHelps) {
-    EXPECT_THAT(
-        CheckFiles("<Map>\n  <FourCharMapping FourChar='dvc '\n      vcid='0'/>\n</Map>",
-                   "<Infos>\n" + Record(Good()) + "</Infos>")
-            .findings.size(),
-        1u);
+    EXPECT_THAT(CheckFiles("<Map>\n  <FourCharMapping FourChar='dvc '\n      vcid='0'/>\n</Map>",
+                           "<Infos>\n" + Record(Good()) + "</Infos>")
+                    .findings.size(),
+                1u);
     const Texts texts =
         TextsOf(CheckFiles("<Map>\n  <FourCharMapping FourChar='dvc '\n      vcid='0'/>\n</Map>",
                            "<Infos>\n" + Record(Good()) + "</Infos>"));
@@ -159,10 +157,10 @@ TEST_F(DataChecks, FindEveryValueThatARecordMustHave) {
                 Contains(HasSubstr("lacks rp210:VideoLineMap")));
     EXPECT_THAT(Check(Record(Good(), "10000", "CDCI", "<rp210:VideoLineMap/>")),
                 Contains(HasSubstr("rp210:VideoLineMap must have one or two line numbers")));
-    EXPECT_THAT(Check(Record(Good(), "10000", "MPEG2Video")),
-                AllOf(Contains(HasSubstr("lacks rp210:BitRate")),
-                      Contains(HasSubstr("lacks rp210:MaxGOP")),
-                      Contains(HasSubstr("lacks rp210:ProfileAndLevel"))));
+    EXPECT_THAT(
+        Check(Record(Good(), "10000", "MPEG2Video")),
+        AllOf(Contains(HasSubstr("lacks rp210:BitRate")), Contains(HasSubstr("lacks rp210:MaxGOP")),
+              Contains(HasSubstr("lacks rp210:ProfileAndLevel"))));
     EXPECT_THAT(Check(Record(Good(), "10000", "RGBA")),
                 AllOf(Contains(HasSubstr("lacks rp210:ComponentMaxRef")),
                       Contains(HasSubstr("lacks rp210:PixelLayout"))));
@@ -190,9 +188,8 @@ TEST_F(DataChecks, FindLabelsThatComeOutWrong) {
         EXPECT_THAT(Check(Record(With("PictureEssenceCoding", label))),
                     Contains(HasSubstr("rp210:PictureEssenceCoding is no universal label")));
     }
-    EXPECT_THAT(
-        Check(Record(With("EssenceContainerLabel", "060e2b34-0401010d-04810202-03060400"))),
-        Contains(HasSubstr("has a byte of 80h or more in its second half")));
+    EXPECT_THAT(Check(Record(With("EssenceContainerLabel", "060e2b34-0401010d-04810202-03060400"))),
+                Contains(HasSubstr("has a byte of 80h or more in its second half")));
 }
 
 TEST_F(DataChecks, FindAProfileThatWouldBePassedOver) {
@@ -309,10 +306,11 @@ TEST_F(DataChecks, FindCodesThatLeadNowhere) {
 }
 
 TEST_F(DataChecks, FindRastersOfTheModulesTableWithoutARecord) {
-    EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10000'") + Row("apch", "") + Row("apch", "")),
-                Contains(HasSubstr("FourCharMapper.xml:4:1: code \"apch\" has no record for "
-                                   "1920x1080 frames; add one with ResolutionID 3710 and "
-                                   "FrameLayout 0")));
+    EXPECT_THAT(
+        Check(Record(Good()), Row("dvc ", "vcid='10000'") + Row("apch", "") + Row("apch", "")),
+        Contains(HasSubstr("FourCharMapper.xml:4:1: code \"apch\" has no record for "
+                           "1920x1080 frames; add one with ResolutionID 3710 and "
+                           "FrameLayout 0")));
 }
 
 TEST_F(DataChecks, FindRowsThatNoMovieGetsItsIdBy) {
@@ -324,14 +322,14 @@ TEST_F(DataChecks, FindRowsThatNoMovieGetsItsIdBy) {
     EXPECT_THAT(Check(records, Row("v210", "vcid='10000'") + Row("v210", "vcid='10000'")),
                 ElementsAre(AllOf(HasSubstr("FourCharMapper.xml:2:1: "),
                                   HasSubstr("of rows without Vendor the last counts"))));
-    EXPECT_THAT(Check(records, Row("dvc ", "vcid='10000'") + Row("apch", "vcid='10000'") +
-                                   Row("apch", "")),
-                Contains(AllOf(HasSubstr("FourCharMapper.xml:3:1: no movie gets id 10000"),
-                               HasSubstr("the module's own table"))));
-    EXPECT_THAT(Check(records, Row("v210", "Vendor='FFMP' vcid='10000'") +
-                                   Row("v210", "Vendor='appl' vcid='10000'") +
-                                   Row("v210", "vcid='10000'")),
-                IsEmpty());
+    EXPECT_THAT(
+        Check(records, Row("dvc ", "vcid='10000'") + Row("apch", "vcid='10000'") + Row("apch", "")),
+        Contains(AllOf(HasSubstr("FourCharMapper.xml:3:1: no movie gets id 10000"),
+                       HasSubstr("the module's own table"))));
+    EXPECT_THAT(
+        Check(records, Row("v210", "Vendor='FFMP' vcid='10000'") +
+                           Row("v210", "Vendor='appl' vcid='10000'") + Row("v210", "vcid='10000'")),
+        IsEmpty());
 }
 
 // What is wrong in one file does not make all of the other wrong.
@@ -343,8 +341,8 @@ TEST_F(DataChecks, TellNothingThatFollowsFromAnotherMistake) {
 }
 
 TEST_F(DataChecks, TellWhereAFileIsNotWellFormedAndCheckTheOther) {
-    const CheckedData checked = CheckFiles("<Map>\n" + Row("dvc ", "vcid='0'") + "</Map>",
-                                           "<Infos>\n  <a>\n</Infos>");
+    const CheckedData checked =
+        CheckFiles("<Map>\n" + Row("dvc ", "vcid='0'") + "</Map>", "<Infos>\n  <a>\n</Infos>");
     EXPECT_THAT(TextsOf(checked),
                 ElementsAre(HasSubstr("FourCharMapper.xml:2:34: vcid can't be \"0\""),
                             HasSubstr("AAFInfo.xml:3:3: this is no well-formed XML: mismatched")));
@@ -382,8 +380,9 @@ TEST_F(DataChecks, TakeManyRowsOfOneCodeAndRecordsOfOneId) {
     for (int i = 0; i < 3000; ++i) {
         records += Record(Good());
     }
-    EXPECT_GT(CheckFiles("<Map>" + rows + "</Map>", "<Infos>" + records + "</Infos>").counts.findings,
-              100'000u);
+    EXPECT_GT(
+        CheckFiles("<Map>" + rows + "</Map>", "<Infos>" + records + "</Infos>").counts.findings,
+        100'000u);
 }
 
 }  // namespace

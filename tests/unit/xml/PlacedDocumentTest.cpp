@@ -46,7 +46,8 @@ TEST_F(PlacedDocuments, KnowWhereElementsAndAttributesStand) {
 }
 
 TEST_F(PlacedDocuments, CountCharactersAndEveryEndOfALine) {
-    const PlacedElement root = Read("<a>\r\n<b \xC3\xA9='\xC3\xA9' c='1'\r\n d='2'/>\r<c e='3'/></a>");
+    const PlacedElement root =
+        Read("<a>\r\n<b \xC3\xA9='\xC3\xA9' c='1'\r\n d='2'/>\r<c e='3'/></a>");
     ASSERT_EQ(root.elements.size(), 2u) << problem_.text;
     EXPECT_EQ(At(root.elements[0].attributes[1].place), "2:10");
     EXPECT_EQ(At(root.elements[0].attributes[2].place), "3:2");
