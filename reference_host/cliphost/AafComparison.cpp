@@ -103,7 +103,11 @@ public:
 
     ComparisonCounts Run() {
         MatchById();
-        MatchRestByName();
+        MatchRest(
+            [](const ComparedObject& one) { return Name(one.kind, one.name, one.descriptor); });
+        if (pairs_.empty()) {  // files of one clip each
+            MatchRest([](const ComparedObject& one) { return Name(one.kind, "", one.descriptor); });
+        }
         CompareHeaders();
         for (const Entry& entry : before_.entries()) {
             const auto pair = pairs_.find(&entry);
@@ -148,10 +152,12 @@ private:
         }
     }
 
-    // A movie that was written anew has other ids.
-    void MatchRestByName() {
-        std::map<Name, std::vector<Entry*>> there = NamesOfRest(after_);
-        for (const auto& [name, entries] : NamesOfRest(before_)) {
+    // A movie that was written anew has other ids. Pairs those that are the only ones of their name
+    // in both files.
+    template <class NameOf>
+    void MatchRest(const NameOf& nameOf) {
+        std::map<Name, std::vector<Entry*>> there = NamesOfRest(after_, nameOf);
+        for (const auto& [name, entries] : NamesOfRest(before_, nameOf)) {
             const auto found = there.find(name);
             if (found != there.end() && entries.size() == 1 && found->second.size() == 1) {
                 Match(*entries.front(), *found->second.front());
@@ -160,13 +166,14 @@ private:
         }
     }
 
-    static std::map<Name, std::vector<Entry*>> NamesOfRest(FileObjects& file) {
+    template <class NameOf>
+    static std::map<Name, std::vector<Entry*>> NamesOfRest(FileObjects& file,
+                                                           const NameOf& nameOf) {
         std::map<Name, std::vector<Entry*>> names;
         for (Entry& entry : file.entries()) {
             if (!entry.isMatched) {
                 FileObjects::Describe(file.Read(entry), entry.about);
-                names[{entry.about.kind, entry.about.name, entry.about.descriptor}].push_back(
-                    &entry);
+                names[nameOf(entry.about)].push_back(&entry);
             }
         }
         return names;

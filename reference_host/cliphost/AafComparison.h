@@ -33,8 +33,9 @@ struct ComparisonCounts {
 using TakeDifference = std::function<void(const ComparedObject&, const TreeDifference&)>;
 
 // Compares two files, whoever made them, mob by mob. Mobs are those with the same id; of the rest
-// those that are the only ones of their class and name. Who wrote a file and when is left out, and
-// so are definitions, which are compared where they are used. Holds no more than two mobs at once.
+// those that are the only ones of their class and name, or of their class alone where the files
+// share no mob. Who wrote a file and when is left out, and so are definitions, which are compared
+// where they are used. Holds no more than two mobs at once.
 ComparisonCounts CompareFiles(IAAFFile* before, IAAFFile* after, const TakeDifference& take);
 
 }  // namespace cliphost

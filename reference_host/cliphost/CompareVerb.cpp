@@ -60,8 +60,8 @@ void AddCompare(CLI::App& app, const SessionOptions& session, int& status) {
                     "  cliphost compare before.aaf after.aaf --json\n"
                     "  cliphost compare before.aaf after.aaf >/dev/null && echo alike\n\n"
                     "Mobs are those with the same id, or the only ones of their class and name; "
-                    "slots go by their ids, columns and other named\nthings by their names, the "
-                    "rest by content and order. ") +
+                    "slots go by their ids,\ncolumns and other named things by their names, the "
+                    "rest by content and order.\n") +
         kLeftOutOfComparison +
         "\n\nExit status: 0, the files are alike; 1, they differ, or one can't be read as AAF; 2, "
         "the call is at fault.");

@@ -56,7 +56,7 @@ void ComparisonLines::Finish(const ComparisonCounts& counts) {
     const char* before = ": ";
     const auto add = [&](std::size_t count, const char* word) {
         if (count > 0) {
-            text += fmt::format("{}{} {}", before, Counted(count, "mob"), word);
+            text += fmt::format("{}{} {}", before, Counted(count, "object"), word);
             before = ", ";
         }
     };

@@ -12,8 +12,8 @@ namespace cliphost {
 
 // What is left out of a comparison, for the help of verbs.
 inline constexpr char kLeftOutOfComparison[] =
-    "What always differs is left out: who wrote the file and when (CreationTime, LastModified, the "
-    "identifications). Definitions count\nwhere they are used.";
+    "What always differs is left out: who wrote a file and when (CreationTime, LastModified, "
+    "Generation, the\nidentifications). Definitions count where they are used.";
 
 // Prints differences for people as they come, each object's under its name.
 class ComparisonLines {

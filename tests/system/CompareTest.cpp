@@ -73,7 +73,7 @@ TEST_F(CompareVerb, FindsNothingBetweenTwoDescriptionsOfAMovie) {
     Describe(movie, "--aaf " + In("b.aaf"));
     const CommandResult compared = RunCliphost("compare " + In("a.aaf") + " " + In("b.aaf"));
     EXPECT_EQ(compared.status, 0);
-    EXPECT_EQ(compared.out, "no differences: 3 mobs alike\n");
+    EXPECT_EQ(compared.out, "no differences: 3 objects alike\n");
 }
 
 TEST_F(CompareVerb, NeedsNoModule) {
@@ -90,10 +90,18 @@ TEST_F(CompareVerb, TellsInWordsWhatIsOtherInAMovieThatWasWrittenAnew) {
     ExpectSays(compared, 1, "master mob \"a\"\n  mob id urn:smpte:umid:");
     ExpectSays(compared, 1, "  picture slot 3: length 10 -> 11\n");
     ExpectSays(compared, 1, "source mob \"a\" (MultipleDescriptor)\n");
-    ExpectSays(compared, 1, "  locator: url string ");
-    ExpectSays(compared, 1, ": 3 mobs changed\n");
+    ExpectSays(compared, 1, "  essence description: locator: url string ");
+    ExpectSays(compared, 1, ": 3 objects changed\n");
     EXPECT_EQ(compared.out.find("source id"), std::string::npos)
         << "what leads to a mob that is known leads there";
+}
+
+TEST_F(CompareVerb, HoldsTwoFilesOfOneClipAgainstEachOtherWhateverItsName) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("b.mov", 11), "--aaf " + In("b.aaf"));
+    const CommandResult compared = RunCliphost("compare " + In("a.aaf") + " " + In("b.aaf"));
+    ExpectSays(compared, 1, "  name \"a\" -> \"b\"\n");
+    ExpectSays(compared, 1, ": 3 objects changed\n");
 }
 
 TEST_F(CompareVerb, TellsWhatCameIntoABinAndWhatWent) {
@@ -105,7 +113,7 @@ TEST_F(CompareVerb, TellsWhatCameIntoABinAndWhatWent) {
     const CommandResult compared = RunCliphost("compare " + In("old.aaf") + " " + In("new.aaf"));
     ExpectSays(compared, 1, "master mob \"a\" gone\n");
     ExpectSays(compared, 1, "master mob \"c\" new\n");
-    ExpectSays(compared, 1, "6 differences: 3 mobs alike, 3 mobs gone, 3 mobs new\n");
+    ExpectSays(compared, 1, "6 differences: 3 objects alike, 3 objects gone, 3 objects new\n");
     EXPECT_EQ(compared.out.find("\"b\""), std::string::npos) << compared.out;
 }
 
@@ -203,7 +211,7 @@ TEST_F(DescribeAgainst, FindsNothingOtherThanBefore) {
     Describe(movie, "--aaf " + In("a.aaf"));
     const CommandResult again = RunCliphost("describe " + movie + " --against " + In("a.aaf"));
     EXPECT_EQ(again.status, 0) << again.out;
-    EXPECT_EQ(again.out, (folder() / "in/a.mov").string() + "\nno differences: 3 mobs alike\n");
+    EXPECT_EQ(again.out, (folder() / "in/a.mov").string() + "\nno differences: 3 objects alike\n");
 }
 
 TEST_F(DescribeAgainst, TellsOfABinWhateverTheJobs) {
@@ -213,7 +221,7 @@ TEST_F(DescribeAgainst, TellsOfABinWhateverTheJobs) {
     for (const char* const jobs : {"1", "2"}) {
         const std::string call =
             "describe " + In("in") + " --against " + In("old.aaf") + " --jobs " + std::string(jobs);
-        ExpectSays(RunCliphost(call), 0, "no differences: 6 mobs alike\n");
+        ExpectSays(RunCliphost(call), 0, "no differences: 6 objects alike\n");
     }
     Movie("in/b.mov", 12);
     for (const char* const jobs : {"1", "2"}) {
@@ -221,7 +229,7 @@ TEST_F(DescribeAgainst, TellsOfABinWhateverTheJobs) {
             "describe " + In("in") + " --against " + In("old.aaf") + " --jobs " + std::string(jobs);
         const CommandResult compared = RunCliphost(call);
         ExpectSays(compared, 1, "picture slot 3: length 11 -> 12\n");
-        ExpectSays(compared, 1, ": 3 mobs alike, 3 mobs changed\n");
+        ExpectSays(compared, 1, ": 3 objects alike, 3 objects changed\n");
         EXPECT_EQ(compared.out.find("MasterMob"), std::string::npos) << "no tree is shown";
     }
 }
