@@ -52,10 +52,10 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
                            const cliphost::TreeDifference& difference) {
         told += (InWords(object) + InWords(difference)).empty() ? 0 : 1;
     };
-    if (!CompareFiles(before.get(), after.get(), count).AreEqual() || told > 0) {
+    if (!cliphost::CompareFiles(before.get(), after.get(), count).AreEqual() || told > 0) {
         std::abort();
     }
-    const cliphost::ComparisonCounts none = CompareFiles(before.get(), nullptr, count);
+    const cliphost::ComparisonCounts none = cliphost::CompareFiles(before.get(), nullptr, count);
     if (none.alike > 0 || none.differences != told) {
         std::abort();
     }

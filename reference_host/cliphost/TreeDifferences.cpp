@@ -30,7 +30,7 @@ constexpr std::string_view kStartOfMobIds = "urn:smpte:umid:";
 
 // Of values in words.
 constexpr std::size_t kLongestValue = 160;
-constexpr std::size_t kShownBefore = 20;  // of what two long values have in common
+constexpr std::size_t kShownBefore = 30;  // of what two long values have in common
 // Objects with no more facts are told whole.
 constexpr std::size_t kFewFacts = 2;
 

@@ -187,7 +187,7 @@ TEST(TreeDifferences, ShowLongValuesWhereTheyBeginToDiffer) {
                                     Node("Mob", {{"Name", start + "second" + start}}));
     ASSERT_EQ(texts.size(), 1u);
     EXPECT_LT(texts[0].size(), 500u);
-    EXPECT_NE(texts[0].find("...xxxxxxxxxxxxxxxxxxxxfirst"), std::string::npos) << texts[0];
+    EXPECT_NE(texts[0].find("..." + std::string(30, 'x') + "first"), std::string::npos) << texts[0];
     EXPECT_NE(texts[0].find("second"), std::string::npos) << texts[0];
 }
 
