@@ -14,6 +14,7 @@
 #include "reference_host/cliphost/AafComparison.h"
 #include "reference_host/util/Ref.h"
 #include "tests/support/TestFolder.h"
+#include "text/Encodings.h"
 
 // The library's function, linked by name.
 extern "C" HRESULT AAFFileOpenExistingRead(aafCharacter_constptr fileName, aafUInt32 modeFlags,
@@ -29,8 +30,10 @@ const std::filesystem::path& TheFile() {
 }
 
 host::Ref<IAAFFile> Open() {
+    static const std::wstring name =
+        encodings::ToWideLossy(encodings::FromUtf8(TheFile().string()));
     host::Ref<IAAFFile> file;
-    if (AAFFileOpenExistingRead(TheFile().wstring().c_str(), 0, file.Out()) < 0) {
+    if (AAFFileOpenExistingRead(name.c_str(), 0, file.Out()) < 0) {
         file.Reset();
     }
     return file;
