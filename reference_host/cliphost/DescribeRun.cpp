@@ -6,6 +6,7 @@
 
 #include <nlohmann/json.hpp>
 
+#include "reference_host/cliphost/ComparisonReport.h"
 #include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
@@ -77,6 +78,11 @@ DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
       rows_(options.form.columns) {
     if (!options.movies.together.empty()) {
         session.aaf().TryToSave(options.movies.together);
+    }
+    if (!options.against.empty()) {
+        against_ = session.aaf().Open(options.against);
+    }
+    if (!options.movies.together.empty() || against_) {
         bin_.emplace(session.aaf());
     }
 }
@@ -86,7 +92,8 @@ void DescribeRun::RefuseOutputsOntoOthers() const {
     const std::filesystem::path& table = options_.form.columnsOut;
     const std::vector<CallFile> read = {{"the list of movies", movies.list},
                                         {"the table of --columns", options_.form.columns.file},
-                                        {"the settings file", options_.settingsFile}};
+                                        {"the settings file", options_.settingsFile},
+                                        {"the file of --against", options_.against}};
     RefuseOutputOnto(movies.file, read);
     RefuseOutputOnto(movies.together, read);
     RefuseOutputOnto(table, read);
@@ -246,13 +253,53 @@ void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& an
     AddEntry(head, answer.description);
 }
 
+// As if the bin had been saved and was compared then.
+void DescribeRun::TellDifferences() {
+    const std::filesystem::path& file = options_.against;
+    if (IsStopped() || bin_->clips().empty()) {
+        throw Failure(kExitFile, file,
+                      IsStopped() ? "not compared: not all movies were read"
+                                  : "not compared: no movie was described");
+    }
+    ordered_json differences = ordered_json::array();
+    ComparisonLines lines;
+    const ComparisonCounts counts =
+        CompareFiles(against_.get(), bin_->file(),
+                     [&](const ComparedObject& object, const TreeDifference& difference) {
+                         if (options_.form.json) {
+                             differences.push_back(ToJson(object, difference));
+                         } else {
+                             lines.Take(object, difference);
+                         }
+                     });
+    CountStatus(StatusOf(counts));
+    if (options_.form.json) {
+        AddEntry({{"against", MachinePath(file)},
+                  {"differences", std::move(differences)},
+                  {"counts", ToJson(counts)}},
+                 "");
+    } else {
+        lines.Finish(counts);
+    }
+}
+
 void DescribeRun::Finish(int described, int failed) {
-    if (bin_) {
+    if (!options_.movies.together.empty()) {
         try {
             SaveBin();
         } catch (const Failure& failure) {
             TellAlso(failure);
             ordered_json head = {{"aaf", MachinePath(options_.movies.together)}};
+            AddProblem(failure.problem(), head);
+            AddEntry(head, "");
+        }
+    }
+    if (against_) {
+        try {
+            TellDifferences();
+        } catch (const Failure& failure) {
+            TellAlso(failure);
+            ordered_json head = {{"against", MachinePath(options_.against)}};
             AddProblem(failure.problem(), head);
             AddEntry(head, "");
         }

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "reference_host/cliphost/ColumnsOption.h"
+#include "reference_host/cliphost/ComparisonReport.h"
 #include "reference_host/cliphost/DescribeRun.h"
 #include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
@@ -105,7 +106,10 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost describe --files-from LIST --out-dir DIR --skip-done --jsonl\n"
         "  cliphost describe --files-from LIST --out-dir DIR --shard 2/16\n"
         "  cliphost describe --watch FOLDER --recursive --out-dir DIR --skip-done\n"
-        "  cliphost describe --watch /mnt/nas/in --poll 30 --out-dir DIR");
+        "  cliphost describe --watch /mnt/nas/in --poll 30 --out-dir DIR\n"
+        "  cliphost describe FOLDER --against OLD.aaf   # what a new version changes\n\n"
+        "--against compares as `cliphost compare` does; differences give status 1.\n" +
+        std::string(kLeftOutOfComparison));
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
     auto* const aaf =
@@ -125,7 +129,15 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                    "programs that show sequences alone")
         ->needs(bin);
     AddForm(*verb, options->form, *pinned);
+    auto* const against =
+        verb->add_option("--against", options->against,
+                         "Compare what is described with this AAF file, which an earlier call "
+                         "saved with --aaf or --bin, and tell in words what is other now")
+            ->excludes(aaf)
+            ->excludes("--out-dir");
     AddInputOptions(*verb, options->movies, *aaf);
+    // The file is of all movies.
+    verb->get_option("--shard")->excludes(against);
     // What was done before is not looked at, so that nothing is known of it.
     verb->get_option("--columns-out")->excludes("--skip-done");
     AddWorkerOptions(*verb, options->movies.workers);
@@ -162,6 +174,10 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                 options->settingsFile = app.get_config_ptr()->as<std::string>();
             }
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
+            if (!options->against.empty()) {
+                options->form.quiet = true;
+                options->movies.workers.arguments.emplace_back("--quiet");
+            }
             Session running(WithTime(session, *pinned));
             if (watch->isOn) {
                 status = kExitCaller;  // until a signal ends it

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 #include <filesystem>
 #include <map>
@@ -84,6 +85,8 @@ protected:
     Description DescriptionOf(const MovieStep& step);
     // Tells a problem that is not a movie's; it counts for the exit status.
     void TellAlso(const Failure& failure);
+    // What counts for it without a problem.
+    void CountStatus(int status) { status_ = std::max(status_, status); }
 
 private:
     struct Held;

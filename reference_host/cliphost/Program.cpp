@@ -116,6 +116,7 @@ int Run(int argc, char** argv) {
     AddContact(app, session, status);
     AddAudio(app, session, status);
     AddDump(app, session);
+    AddCompare(app, session, status);
     AddVerify(app, session, status);
     AddRelink(app, session, status);
     AddCatalog(app, session, status);
@@ -123,6 +124,7 @@ int Run(int argc, char** argv) {
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);
+    AddCheckData(app, session, status);
     AddHelpFiles(app);
     AddSettingsFile(app);
     TellExitStatus(app);

@@ -13,6 +13,7 @@
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/data_check/Findings.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/parameters/RegisterParameterComponents.h"
@@ -80,6 +81,11 @@ std::string WithoutLineEnd(std::string text) {
 
 }  // namespace
 
+std::filesystem::path ModuleFile(const SessionOptions& options) {
+    return options.plugin.empty() ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"
+                                  : options.plugin;
+}
+
 std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options) {
     auto library = std::make_unique<AafLibrary>(
         options.aafLibrary.empty() ? options.programFolder / kAAFLibraryName : options.aafLibrary);
@@ -111,9 +117,7 @@ Session::Session(const SessionOptions& options)
     RegisterMovieComponent<host::MakeQuickTimeProperty>(*host_,
                                                         QuickTime::CompID_QuickTimeProperty);
 
-    const std::filesystem::path module =
-        options.plugin.empty() ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"
-                               : options.plugin;
+    const std::filesystem::path module = ModuleFile(options);
     std::error_code ignored;
     // The module looks for its data files by the path that it was loaded from.
     if (host::system::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
@@ -138,7 +142,7 @@ std::vector<std::string> Session::TakeNotices() {
 
 std::vector<std::filesystem::path> Session::DataFiles() const {
     const std::filesystem::path folder = plugin_->file().parent_path();
-    return {folder / "FourCharMapper.xml", folder / "AAFInfo.xml"};
+    return {folder / data_check::kDataFileNames[0], folder / data_check::kDataFileNames[1]};
 }
 
 Problem BackslashProblem(const std::filesystem::path& path) {

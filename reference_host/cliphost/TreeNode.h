@@ -21,8 +21,10 @@ struct TreeNode {
     struct Branch {
         std::string name;
         std::vector<TreeNode> nodes;
+        bool isSet = false;  // their order means nothing
     };
     std::vector<Branch> branches;
+    bool isCut = false;  // it lies too deep: what it holds was not read
 };
 
 // Indented lines, one for each fact whatever it holds.

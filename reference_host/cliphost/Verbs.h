@@ -20,10 +20,12 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status);
 void AddTypes(CLI::App& app, const SessionOptions& session, int& status);
 void AddParams(CLI::App& app, const SessionOptions& session, int& status);
 void AddDump(CLI::App& app, const SessionOptions& session);
+void AddCompare(CLI::App& app, const SessionOptions& session, int& status);
 void AddVerify(CLI::App& app, const SessionOptions& session, int& status);
 void AddRelink(CLI::App& app, const SessionOptions& session, int& status);
 void AddCatalog(CLI::App& app, const SessionOptions& session, int& status);
 void AddFind(CLI::App& app, int& status);
+void AddCheckData(CLI::App& app, const SessionOptions& session, int& status);
 void AddHelpFiles(CLI::App& app);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
 

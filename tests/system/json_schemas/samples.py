@@ -38,6 +38,9 @@ SAMPLES = [
         ("describe", "--jsonl", "in fragmented.mp4 absent.mov --out-dir out", 2),
         ("describe", "--jsonl", "in --out-dir out --skip-done --jobs 2"),
         ("describe", "--jsonl", "bad --bin absent/bin.aaf", 2),
+        ("describe", "--json", "in --against bin.aaf"),
+        ("describe", "--json", "away --against bin.aaf", 1),
+        ("describe", "--json", "bad/text.mov --against bin.aaf", 1),
         ("samples", "--json", "in/h264_with_aac.mov"),
         ("samples", "--json", "in/pcm_u8.mov --every"),
         ("samples", "--json", "bad/cut.mov", 1),
@@ -56,6 +59,9 @@ SAMPLES = [
         ("params", "--json", "bad/text.mov", 1),
         ("dump", "--json", "bin.aaf"),
         ("dump", "--json", "bad/no_aaf.aaf", 1),
+        ("compare", "--json", "bin.aaf bin.aaf"),
+        ("compare", "--json", "bin.aaf mapped.aaf", 1),
+        ("compare", "--json", "bin.aaf bad/no_aaf.aaf", 1),
         ("verify", "--json", "bin.aaf"),
         ("verify", "--json", "mapped.aaf bad/no_aaf.aaf", 1),
         ("verify", "--json", "mapped.aaf --search away", 1),
@@ -78,6 +84,10 @@ SAMPLES = [
         ("types", "--json", "--plugin absent", 2),
         ("plugin", "--json", ""),
         ("plugin", "--json", "--plugin absent", 2),
+        ("check-data", "--json", ""),
+        ("check-data", "--json", "data", 1),
+        ("check-data", "--json", "empty", 2),
+        ("check-data", "--json", "absent", 2),
     )
 ]
 
@@ -111,6 +121,8 @@ def make_files(movies, types, work):
     (work / "odd/folder.mov").mkdir()
     (work / "empty").mkdir()
     write("away/pcm.mov", bytes_of("pcm_u8.mov"))
+    write("data/FourCharMapper.xml", b"<Map><FourCharMapping FourChar='abc'/></Map>")
+    write("data/AAFInfo.xml", b"<Infos")
 
 
 def with_size(movie, code, pixels):
