@@ -131,7 +131,7 @@ bool GetModulePath(const void* address, std::wstring* path) {
         return false;
     }
     // A longer path is cut, and counted with the zero that may be missing.
-    path->assign(buffer, buffer + std::min(length, kSize - 1));
+    path->assign(buffer, buffer + std::min<DWORD>(length, kSize - 1));
     return true;
 }
 

@@ -68,11 +68,11 @@ static_assert(IsCalledAs<DWORD WINAPI()>(&GetCurrentThreadId));
 static_assert(IsCalledAs<void*(std::size_t, std::size_t)>(&_aligned_malloc));
 static_assert(IsCalledAs<void(void*)>(&_aligned_free));
 
-// Structures behind these pointers have other names in some headers; no call gives one.
-static_assert(std::is_invocable_r_v<HANDLE, decltype(&CreateFileW), LPCWSTR, DWORD, DWORD,
-                                    std::nullptr_t, DWORD, DWORD, HANDLE>);
-static_assert(
-    std::is_invocable_r_v<BOOL, decltype(&ReadFile), HANDLE, void*, DWORD, DWORD*, std::nullptr_t>);
-static_assert(std::is_invocable_r_v<HANDLE, decltype(&CreateMutexA), std::nullptr_t, BOOL, LPCSTR>);
-static_assert(std::is_invocable_r_v<DWORD, decltype(&FormatMessageA), DWORD, const void*, DWORD,
-                                    DWORD, LPSTR, DWORD, std::nullptr_t>);
+// These take structures and lists that have other names in some headers; nobody gives one.
+static_assert(std::is_same_v<HANDLE, decltype(CreateFileW(LPCWSTR{}, DWORD{}, DWORD{}, nullptr,
+                                                          DWORD{}, DWORD{}, HANDLE{}))>);
+static_assert(std::is_same_v<BOOL, decltype(ReadFile(HANDLE{}, static_cast<void*>(nullptr), DWORD{},
+                                                     static_cast<DWORD*>(nullptr), nullptr))>);
+static_assert(std::is_same_v<HANDLE, decltype(CreateMutexA(nullptr, BOOL{}, LPCSTR{}))>);
+static_assert(std::is_same_v<DWORD, decltype(FormatMessageA(DWORD{}, nullptr, DWORD{}, DWORD{},
+                                                            LPSTR{}, DWORD{}, nullptr))>);

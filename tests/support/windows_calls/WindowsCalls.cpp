@@ -250,10 +250,11 @@ BOOL ReadFile(HANDLE handle, void* buffer, DWORD size, DWORD* bytesRead, OVERLAP
     const std::uint64_t left = open->position < length ? length - open->position : 0;
     *bytesRead = static_cast<DWORD>(std::min<std::uint64_t>(left, size));
     const std::vector<std::uint8_t>& bytes = open->file->bytes;
-    for (DWORD i = 0; i < *bytesRead; ++i) {
-        const std::uint64_t at = open->position + i;
-        static_cast<std::uint8_t*>(buffer)[i] = at < bytes.size() ? bytes[at] : 0;
-    }
+    const std::uint64_t held = open->position < bytes.size() ? bytes.size() - open->position : 0;
+    const auto copied = static_cast<std::size_t>(std::min<std::uint64_t>(held, *bytesRead));
+    std::copy_n(bytes.data() + (copied ? open->position : 0), copied,
+                static_cast<std::uint8_t*>(buffer));
+    std::memset(static_cast<std::uint8_t*>(buffer) + copied, 0, *bytesRead - copied);
     open->position += *bytesRead;
     return TRUE;
 }
