@@ -3,13 +3,11 @@
 
 // The operating system, by its calls on 64-bit Windows.
 
+#include "source/plugin/os/Os.h"
+
 #include <windows.h>
 
 #include <malloc.h>
-
-#include <algorithm>
-
-#include "source/plugin/os/Os.h"
 
 namespace os {
 namespace {
@@ -131,7 +129,7 @@ bool GetModulePath(const void* address, std::wstring* path) {
         return false;
     }
     // A longer path is cut, and counted with the zero that may be missing.
-    path->assign(buffer, buffer + std::min<DWORD>(length, kSize - 1));
+    path->assign(buffer, buffer + (length < kSize ? length : kSize - 1));
     return true;
 }
 
