@@ -14,7 +14,7 @@ bool HasAvx2() {
 #ifdef _MSC_VER
     constexpr int kAvxAndItsControl = 1 << 28 | 1 << 27;
     constexpr int kAvx2 = 1 << 5;
-    constexpr unsigned long long kWideRegisters = 6;
+    constexpr ncfUInt64 kWideRegisters = 6;
     int answer[4] = {};
     __cpuid(answer, 0);
     if (answer[0] < 7) {

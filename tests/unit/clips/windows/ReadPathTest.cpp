@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <cstdlib>
 #include <memory>
 #include <random>
 #include <string>
@@ -87,7 +88,9 @@ TEST_P(WindowsVolumes, GiveAnyRangeToAnyAddress) {
     SimpleFileIO file(path.inArg());
     std::mt19937 random(20261122);
     const auto below = [&](std::size_t end) { return static_cast<ncfUInt32>(random() % end); };
-    alignas(65536) static ncfUInt8 memory[196'608];
+    const std::unique_ptr<void, void (*)(void*)> block(std::aligned_alloc(65'536, 196'608),
+                                                       std::free);
+    auto* const memory = static_cast<ncfUInt8*>(block.get());
     for (int i = 0; i < 300; ++i) {
         // Every other range begins and ends with sectors, every third address is aligned.
         const ncfUInt32 step = i % 2 == 0 ? 4096 : 1;
