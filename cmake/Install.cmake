@@ -44,7 +44,7 @@ install(FILES "cmake/cliphost-watch@.service" DESTINATION lib/systemd/system)
 
 install(FILES LICENSE RENAME copyright DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
 install(FILES README.md DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
-install(DIRECTORY docs DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
+install(DIRECTORY docs examples DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost)
 install(PROGRAMS scripts/cluster/describe.sbatch scripts/cluster/describe_ssh.sh
         DESTINATION ${CMAKE_INSTALL_DATADIR}/doc/cliphost/cluster)
 

@@ -16,8 +16,8 @@
 #include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
 #include "reference_host/catalog/Catalog.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
 
 namespace {
 

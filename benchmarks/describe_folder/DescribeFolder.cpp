@@ -19,7 +19,7 @@
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/MovieAnswer.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 extern "C" {
 #include <libavformat/avformat.h>

@@ -21,8 +21,8 @@
 #include "benchmarks/header_parser/LongMovie.h"
 #include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
 
 namespace {
 

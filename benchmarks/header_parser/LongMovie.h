@@ -5,7 +5,7 @@
 #include <cstdint>
 #include <filesystem>
 
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 // A movie of `samples` pictures, 120 a second so that no length goes beyond a day, that makes the
 // tables long: a size and a display offset for each sample, ten samples in a chunk, a sync sample

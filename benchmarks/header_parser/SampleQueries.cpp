@@ -14,8 +14,8 @@
 #include "benchmarks/header_parser/LongMovie.h"
 #include "benchmarks/support/Ratios.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/movie_writer/TrackAtoms.h"
 #include "reference_host/util/Ref.h"
-#include "tests/support/movies/TrackAtoms.h"
 
 namespace {
 

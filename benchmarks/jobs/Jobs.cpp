@@ -12,9 +12,9 @@
 
 #include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/support/Quoted.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
 
 namespace {
 
@@ -73,8 +73,8 @@ void TwoJobs(benchmark::State& state) {
     Run(state, Described("2", Folders().Half("a") + " " + Folders().Half("b")));
 }
 void TwoPrograms(benchmark::State& state) {
-    Run(state, Described("1", Folders().Half("a")) + " & " +
-                   Described("1", Folders().Half("b")) + " && wait $!");
+    Run(state, Described("1", Folders().Half("a")) + " & " + Described("1", Folders().Half("b")) +
+                   " && wait $!");
 }
 
 BENCHMARK(OneJob)->Unit(benchmark::kMillisecond)->UseRealTime()->Repetitions(5);

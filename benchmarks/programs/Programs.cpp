@@ -13,8 +13,8 @@
 #include <vector>
 
 #include "benchmarks/support/Ratios.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/support/Quoted.h"
-#include "tests/support/movies/Movie.h"
 
 namespace {
 

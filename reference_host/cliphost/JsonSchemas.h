@@ -21,6 +21,7 @@ inline constexpr char kTypes[] = "types/1.0";
 inline constexpr char kParams[] = "params/1.0";
 inline constexpr char kPlugin[] = "plugin/1.0";
 inline constexpr char kCheckData[] = "check-data/1.0";
+inline constexpr char kValidate[] = "validate/1.0";
 
 inline constexpr char kMember[] = "schema";  // the first one of an answer
 

@@ -125,6 +125,7 @@ int Run(int argc, char** argv) {
     AddParams(app, session, status);
     AddPlugin(app, session, status);
     AddCheckData(app, session, status);
+    AddValidate(app, session, status);
     AddHelpFiles(app);
     AddSettingsFile(app);
     TellExitStatus(app);

@@ -96,6 +96,14 @@ std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options) {
     return library;
 }
 
+void RegisterServices(host::Host& host) {
+    host::RegisterXmlComponents(host);
+    host::RegisterParameterComponents(host);
+    host.RegisterComponent(NCFCompID_QTParser, header_parser::QTParserMaker());
+    RegisterMovieComponent<host::MakeQuickTimeWrapper>(host, QTWrapper::CompID_QuickTimeWrapper);
+    RegisterMovieComponent<host::MakeQuickTimeProperty>(host, QuickTime::CompID_QuickTimeProperty);
+}
+
 Session::Session(const SessionOptions& options)
     : verbosity_(options.verbosity), aaf_(LoadAafLibrary(options)) {
     NMASetLogLevel(options.verbosity >= 2 ? 8 : options.verbosity == 1 ? 1 : 0);
@@ -110,12 +118,7 @@ Session::Session(const SessionOptions& options)
             Notice("console {}: {}\n", level, line);
         }
     });
-    host::RegisterXmlComponents(*host_);
-    host::RegisterParameterComponents(*host_);
-    host_->RegisterComponent(NCFCompID_QTParser, header_parser::QTParserMaker());
-    RegisterMovieComponent<host::MakeQuickTimeWrapper>(*host_, QTWrapper::CompID_QuickTimeWrapper);
-    RegisterMovieComponent<host::MakeQuickTimeProperty>(*host_,
-                                                        QuickTime::CompID_QuickTimeProperty);
+    RegisterServices(*host_);
 
     const std::filesystem::path module = ModuleFile(options);
     std::error_code ignored;

@@ -32,6 +32,9 @@ std::filesystem::path ModuleFile(const SessionOptions& options);
 // The AAF library that the command line means, for verbs that need no module. Throws a Failure.
 std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options);
 
+// Registers what a host of clips has besides the framework: parser, wrapper, XML, parameters.
+void RegisterServices(host::Host& host);
+
 // A host with all its services and the module loaded into it.
 class Session {
 public:

@@ -26,6 +26,7 @@ void AddRelink(CLI::App& app, const SessionOptions& session, int& status);
 void AddCatalog(CLI::App& app, const SessionOptions& session, int& status);
 void AddFind(CLI::App& app, int& status);
 void AddCheckData(CLI::App& app, const SessionOptions& session, int& status);
+void AddValidate(CLI::App& app, const SessionOptions& session, int& status);
 void AddHelpFiles(CLI::App& app);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
 

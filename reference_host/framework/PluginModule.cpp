@@ -35,6 +35,18 @@ void FindFunction(const system::SharedLibrary& library, const char* name, Functi
 
 }  // namespace
 
+Maker MakerOfClass(NCFGetClassFactoryFunction getClassFactory, const GUID& classId) {
+    return [=](INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out) -> NCFRESULT {
+        void* made = nullptr;
+        const NCFRESULT found = getClassFactory(host, classId, IID_INCFClassFactory, &made);
+        const auto maker = Ref<INCFClassFactory>::Adopt(static_cast<INCFClassFactory*>(made));
+        if (found < 0 || !maker) {
+            return found < 0 ? found : NCF_E_UNEXPECTED;
+        }
+        return maker->CreateInstance(host, outer, iid, out);
+    };
+}
+
 PluginModule::PluginModule(const std::filesystem::path& file, INCFUnknown& host,
                            ComponentFactory& factory)
     : file_(file), host_(&host), factory_(&factory) {}
@@ -139,19 +151,8 @@ void PluginModule::EnterComponents() {
                                                             IID_INCFClassFactory, &factory);
         component.hasFactory = result >= 0 && factory != nullptr;
         ReleaseOutput(factory);
-        factory_->Register(
-            component.id,
-            [classId = component.classId, getClassFactory = functions_.getClassFactory](
-                INCFUnknown* host, INCFUnknown* outer, const GUID& iid, void** out) -> NCFRESULT {
-                void* made = nullptr;
-                const NCFRESULT found = getClassFactory(host, classId, IID_INCFClassFactory, &made);
-                const auto maker =
-                    Ref<INCFClassFactory>::Adopt(static_cast<INCFClassFactory*>(made));
-                if (found < 0 || !maker) {
-                    return found < 0 ? found : NCF_E_UNEXPECTED;
-                }
-                return maker->CreateInstance(host, outer, iid, out);
-            });
+        factory_->Register(component.id,
+                           MakerOfClass(functions_.getClassFactory, component.classId));
     }
 }
 

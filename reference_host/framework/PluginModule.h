@@ -20,6 +20,9 @@ struct LoadFailure {
     std::string message;
 };
 
+// Makes objects of a class by the class factories of a started module.
+Maker MakerOfClass(NCFGetClassFactoryFunction getClassFactory, const GUID& classId);
+
 // A plug-in module in the process. Loading goes the way that modules count on:
 //
 //   open, six functions    NCFRegisterPlugin    NCFRegisterComponent 0, 1, ...

@@ -4,6 +4,7 @@
 
 #include <filesystem>
 #include <string>
+#include <vector>
 
 namespace host::system {
 
@@ -23,6 +24,8 @@ public:
 
     // Null when the library exports no such function.
     void* Find(const char* name) const;
+    // What it gives to others by name: functions and data, in no order.
+    std::vector<std::string> Exports() const;
     // Whether this library is what the process gets from now on when it asks the
     // system for `name` without a folder.
     bool IsFoundAs(const char* name) const;

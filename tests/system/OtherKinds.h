@@ -2,7 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "tests/support/movies/Box.h"
+#include "reference_host/movie_writer/Box.h"
 
 // Small files of kinds that FFmpeg does not write.
 

@@ -232,9 +232,10 @@ std::vector<std::string> OptionsOf(const std::string& verb) {
 TEST_F(SettingsFile, TakesEveryOptionOfEveryVerb) {
     const std::set<std::string> none = {"help", "version", "config", "no-config"};
     std::size_t options = 0;
-    for (const char* const verb : {"", "scan", "describe", "samples", "formats", "frame", "contact",
-                                   "audio", "dump", "compare", "verify", "relink", "types",
-                                   "params", "plugin", "check-data", "catalog", "find"}) {
+    for (const char* const verb :
+         {"", "scan", "describe", "samples", "formats", "frame", "contact", "audio", "dump",
+          "compare", "verify", "relink", "types", "params", "plugin", "check-data", "catalog",
+          "find", "validate"}) {
         for (const std::string& name : OptionsOf(verb)) {
             if (none.count(name) == 0) {
                 ++options;

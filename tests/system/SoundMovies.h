@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 // Movies of compressed sound that FFmpeg does not write: its packets, put into
 // the tests' own header.

@@ -11,8 +11,8 @@
 
 #include "reference_host/cliphost/Session.h"
 #include "reference_host/cliphost/TreeNode.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
 
 // A test that drives the built module through the reference host. At its end
 // nothing may be left of what it did: no object of the module or of the host,

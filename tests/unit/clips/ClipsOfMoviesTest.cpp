@@ -5,11 +5,11 @@
 
 #include "reference_host/framework/ObjectCount.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "reference_host/util/Ref.h"
 #include "reference_host/xml/XmlDocument.h"
 #include "source/clips/LoadMedia.h"
 #include "tests/support/TestFolder.h"
-#include "tests/support/movies/Movie.h"
 #include "tests/unit/clips/ClipFixture.h"
 
 namespace {

@@ -9,9 +9,9 @@
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/support/fakes/StubSampleMapping.h"
-#include "tests/support/movies/Movie.h"
 #include "tests/unit/components/ComponentFixture.h"
 
 namespace {

@@ -160,6 +160,12 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFStartup(INCFUnknown*) {
     return NCF_OK;
 }
 
+#ifdef FAULT_further_export
+NCF_PLUGIN_EXPORT int FurtherFunction() {
+    return 1;
+}
+#endif
+
 #ifndef FAULT_no_shutdown
 NCF_PLUGIN_EXPORT NCFRESULT NCFShutdown(INCFUnknown*) {
     Note('E');

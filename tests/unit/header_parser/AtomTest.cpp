@@ -4,7 +4,7 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/support/movies/Box.h"
+#include "reference_host/movie_writer/Box.h"
 
 namespace {
 

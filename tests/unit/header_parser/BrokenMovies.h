@@ -7,7 +7,7 @@
 #include <vector>
 
 #include "host_interfaces/framework/ResultCodes.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 // A file with one defect. The name says which; the fuzzer's corpus keeps the
 // file under it.

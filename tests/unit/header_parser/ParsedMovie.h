@@ -5,8 +5,8 @@
 #include <string>
 
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "reference_host/util/Ref.h"
-#include "tests/support/movies/Movie.h"
 
 // A movie that went through the parser, asked through its interfaces alone.
 class ParsedMovie {

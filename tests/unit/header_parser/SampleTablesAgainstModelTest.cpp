@@ -6,7 +6,7 @@
 #include <cstdlib>
 #include <random>
 
-#include "tests/support/movies/TrackAtoms.h"
+#include "reference_host/movie_writer/TrackAtoms.h"
 #include "tests/unit/header_parser/ParsedMovie.h"
 
 // Random tables against a plain expansion of what they were made from: one

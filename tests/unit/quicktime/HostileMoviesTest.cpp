@@ -4,7 +4,7 @@
 
 #include <random>
 
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/unit/quicktime/AskEverything.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 

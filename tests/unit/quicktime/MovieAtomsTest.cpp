@@ -5,8 +5,8 @@
 #include <algorithm>
 #include <chrono>
 
+#include "reference_host/movie_writer/Movie.h"
 #include "reference_host/quicktime/MovieAtoms.h"
-#include "tests/support/movies/Movie.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;

@@ -9,7 +9,7 @@
 #include <numeric>
 #include <random>
 
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;

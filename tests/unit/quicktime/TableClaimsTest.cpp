@@ -4,8 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include "reference_host/movie_writer/Movie.h"
 #include "reference_host/quicktime/OpenInput.h"
-#include "tests/support/movies/Movie.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;

@@ -8,7 +8,7 @@
 #include <array>
 
 #include "reference_host/framework/String.h"
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
 using namespace quicktime_tests;

@@ -15,11 +15,11 @@
 
 #include "public_include/SimpleFileIO.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "reference_host/util/Ref.h"
 #include "source/clips/LoadMedia.h"
 #include "tests/support/fakes/FakeHost.h"
 #include "tests/support/fakes/RecordingLogger.h"
-#include "tests/support/movies/Movie.h"
 #include "tests/support/windows_calls/WindowsCalls.h"
 #include "tests/unit/clips/ClipFixture.h"
 

@@ -6,10 +6,10 @@
 
 #include "host_interfaces/aaf/AAFFile.h"
 #include "reference_host/header_parser/QTParser.h"
+#include "reference_host/movie_writer/Movie.h"
 #include "source/components/QuickTimeContainer.h"
 #include "source/components/QuickTimeMediaVolume.h"
 #include "tests/support/fakes/FakeLock.h"
-#include "tests/support/movies/Movie.h"
 #include "tests/unit/aaf/support/FakeAAF.h"
 #include "tests/unit/components/ComponentFixture.h"
 #include "tests/unit/components/doubles/Doubles.h"

@@ -16,7 +16,7 @@ using Bytes = std::vector<std::uint8_t>;
 //     Box("mdhd").Version(0).U32(0).U32(0).U32(600).U32(1200).U16(0).U16(0)
 //
 // All numbers are big-endian. Boxes nest by Add. What a box says of its own
-// size can be bent for tests of broken files.
+// size can be bent, to make broken files.
 class Box {
 public:
     // `type` has four characters; fewer are filled with blanks.

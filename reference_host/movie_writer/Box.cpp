@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "tests/support/movies/Box.h"
+#include "reference_host/movie_writer/Box.h"
 
 #include <cmath>
 #include <cstring>

@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "tests/support/movies/Formats.h"
+#include "reference_host/movie_writer/Formats.h"
 
 namespace movies {
 

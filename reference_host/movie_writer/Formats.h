@@ -9,9 +9,9 @@
 #include <utility>
 #include <vector>
 
-#include "tests/support/movies/Box.h"
+#include "reference_host/movie_writer/Box.h"
 
-// Sample descriptions: fill in what the test is about, the rest stands.
+// Sample descriptions: fill in what the movie is about, the rest stands.
 namespace movies {
 
 struct VideoFormat {

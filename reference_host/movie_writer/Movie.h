@@ -9,9 +9,9 @@
 #include <utility>
 #include <vector>
 
-#include "tests/support/movies/Formats.h"
+#include "reference_host/movie_writer/Formats.h"
 
-// Makes QuickTime and ISO base media files for tests, in memory or on disk:
+// Makes QuickTime and ISO base media files, in memory or on disk:
 //
 //     Movie movie;
 //     movie.tracks.push_back(VideoTrack(VideoFormat(), 100, 25000, 1000));
@@ -19,7 +19,7 @@
 //     movie.tracks.push_back(TimecodeTrack(TimecodeFormat(), 90000, 100));
 //     Build(movie).WriteTo("sample.mov");
 //
-// Everything is a plain field with a value that makes a sound movie; a test
+// Everything is a plain field with a value that makes a sound movie; who makes one
 // changes what it is about. Media bytes are holes unless a track says what
 // they are, so a movie of many gigabytes costs no disk.
 namespace movies {

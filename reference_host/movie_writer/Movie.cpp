@@ -1,6 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include "tests/support/movies/Movie.h"
+#include "reference_host/movie_writer/Movie.h"
 
 #include <zlib.h>
 
@@ -10,7 +10,7 @@
 #include <filesystem>
 #include <fstream>
 
-#include "tests/support/movies/TrackAtoms.h"
+#include "reference_host/movie_writer/TrackAtoms.h"
 
 namespace movies {
 

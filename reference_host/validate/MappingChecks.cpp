@@ -1,0 +1,140 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <algorithm>
+
+#include "reference_host/validate/Media.h"
+
+namespace validate {
+namespace {
+
+// A mapping of a sound movie; the check is skipped where the module gives none.
+host::Ref<NMA::ISampleMapping> MappingOf(Containers& containers,
+                                         const std::filesystem::path& movie) {
+    Trial& trial = containers.trial();
+    const auto container = containers.Open(movie);
+    trial.Doing("asking for a movie's sample mapping");
+    host::Ref<NMA::ISampleMapping> mapping;
+    const NCFRESULT result = container->GetSampleMapping(mapping.Out());
+    if (result < 0 || !mapping) {
+        trial.Skip("the module gives no sample mapping of a sound movie: " + trial.Text(result));
+    }
+    return mapping;
+}
+
+// Calls `visit` with each track of a sound movie that has samples, and their number. A mapping may
+// count tracks that have none, such as timecode.
+void ForEachTrack(Trial& trial,
+                  const std::function<void(NMA::ISampleMapping&, ncfUInt32 track, ncfUInt64 samples,
+                                           std::uintmax_t fileSize)>& visit) {
+    Containers containers(trial);
+    const SampleMovie movie = WriteSoundMovie(trial.folder());
+    const auto mapping = MappingOf(containers, movie.file);
+    const ncfSInt32 tracks = mapping->GetNumberOfTracks();
+    bool isAny = false;
+    for (ncfUInt32 track = 0; track < static_cast<ncfUInt32>(std::max(tracks, 0)); ++track) {
+        trial.Doing("asking for the number of samples of track " + std::to_string(track));
+        ncfUInt64 samples = 0;
+        if (mapping->GetNumberOfSamples(track, &samples) >= 0) {
+            isAny = true;
+            visit(*mapping, track, samples, std::filesystem::file_size(movie.file));
+        }
+    }
+    trial.Expect(isAny, "the number of samples of one track at least", "none is told");
+}
+
+void HasTracks(Trial& trial) {
+    Containers containers(trial);
+    const auto mapping = MappingOf(containers, WriteSoundMovie(trial.folder()).file);
+    trial.Doing("calling GetNumberOfTracks for a movie with picture and sound");
+    const ncfSInt32 tracks = mapping->GetNumberOfTracks();
+    trial.Expect(tracks >= 1, "one track at least", std::to_string(tracks));
+}
+
+void TracksHaveSamples(Trial& trial) {
+    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
+                            std::uintmax_t) {
+        trial.Expect(samples >= 1, "one sample at least", "none");
+        trial.Doing("asking for the number of channels of track " + std::to_string(track));
+        ncfUInt32 channels = 0;
+        trial.ExpectSuccess(mapping.GetNumberOfChannels(track, &channels));
+        trial.Expect(channels >= 1, "one channel at least", "none");
+    });
+}
+
+void SamplesLieInTheFile(Trial& trial) {
+    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
+                            std::uintmax_t fileSize) {
+        for (const ncfUInt64 sample : {ncfUInt64{0}, samples / 2, samples - 1}) {
+            trial.Doing("asking where sample " + std::to_string(sample) + " of track " +
+                        std::to_string(track) + " lies");
+            ncfUInt64 position = 0;
+            ncfUInt64 size = 0;
+            trial.ExpectSuccess(mapping.GetSamplePosition(track, sample, &position));
+            trial.ExpectSuccess(mapping.GetSampleSize(track, sample, &size));
+            trial.Expect(size > 0 && position + size <= fileSize, "bytes of the movie's file",
+                         std::to_string(size) + " bytes at " + std::to_string(position) +
+                             " of a file of " + std::to_string(fileSize));
+        }
+    });
+}
+
+void RefusesOtherTracks(Trial& trial) {
+    Containers containers(trial);
+    const auto mapping = MappingOf(containers, WriteSoundMovie(trial.folder()).file);
+    const auto tracks = static_cast<ncfUInt32>(mapping->GetNumberOfTracks());
+    for (const ncfUInt32 track : {tracks, 0x7FFFFFFFu, 0xFFFFFFFFu}) {
+        trial.Doing("asking for samples of track " + std::to_string(track) + " of " +
+                    std::to_string(tracks));
+        ncfUInt64 number = 0;
+        trial.ExpectRefusal(mapping->GetNumberOfSamples(track, &number));
+        trial.ExpectRefusal(mapping->GetSamplePosition(track, 0, &number));
+        trial.ExpectRefusal(mapping->GetSampleSize(track, 0, &number));
+    }
+}
+
+void RefusesOtherSamples(Trial& trial) {
+    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
+                            std::uintmax_t fileSize) {
+        trial.Doing("asking where sample " + std::to_string(samples) + " of track " +
+                    std::to_string(track) + " lies, one beyond the last");
+        ncfUInt64 position = 0;
+        const NCFRESULT result = mapping.GetSamplePosition(track, samples, &position);
+        trial.Expect(result < 0 || position <= fileSize,
+                     "a refusal, or a place in the movie's file",
+                     std::to_string(position) + " of a file of " + std::to_string(fileSize));
+    });
+}
+
+void MappingOutlivesTheContainer(Trial& trial) {
+    Containers containers(trial);
+    const auto mapping = MappingOf(containers, WriteSoundMovie(trial.folder()).file);
+    trial.Doing("using a mapping after its container's end");
+    ncfUInt64 samples = 0;
+    trial.ExpectSuccess(mapping->GetNumberOfSamples(0, &samples));
+    trial.ExpectRefusal(containers.module().canUnloadNow(containers.module().unknown()),
+                        "a mapping counts as alive");
+}
+
+}  // namespace
+
+std::vector<Check> MappingChecks() {
+    return {
+        {"mapping-tracks", "A movie with picture and sound has tracks in its sample mapping.",
+         "the answer is a result instead of the number", HasTracks},
+        {"mapping-samples", "Each track of a mapping tells how many samples and channels it has.",
+         "an output is left as it was", TracksHaveSamples},
+        {"mapping-in-file", "The samples of a mapping lie within the movie's file.",
+         "positions are those of a chunk or of the media", SamplesLieInTheFile},
+        {"mapping-other-tracks", "A mapping refuses a track that is not there.",
+         "the number is not compared", RefusesOtherTracks},
+        {"mapping-other-samples",
+         "For a sample beyond the last, a mapping names no place outside of the file.",
+         "the number is not compared", RefusesOtherSamples},
+        {"mapping-outlives",
+         "A mapping goes on when its container is released, and counts as "
+         "alive.",
+         "the mapping points into the container", MappingOutlivesTheContainer},
+    };
+}
+
+}  // namespace validate

@@ -1,0 +1,204 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include <set>
+
+#include "reference_host/framework/HostPath.h"
+#include "reference_host/util/text/HostText.h"
+#include "reference_host/validate/Media.h"
+
+namespace validate {
+namespace {
+
+void ClaimsAFolderEachTime(Trial& trial) {
+    Volumes volumes(trial);
+    for (int round = 2; round <= 20; ++round) {
+        trial.Doing("calling IsMediaVolume with the same folder, time " + std::to_string(round));
+        trial.Expect(volumes.Claims(volumes.folder()), "1, as the first time", "0");
+    }
+}
+
+void LeavesOtherFolders(Trial& trial) {
+    Volumes volumes(trial);
+    const std::filesystem::path empty = trial.folder() / "empty";
+    std::filesystem::create_directory(empty);
+    trial.Doing("calling IsMediaVolume with an empty folder");
+    trial.Expect(!volumes.Claims(empty), "0", "1");
+    trial.Doing("calling IsMediaVolume with a folder that is not there");
+    trial.Expect(!volumes.Claims(trial.folder() / "absent"), "0", "1");
+    trial.Doing("calling IsMediaVolume with a movie instead of a folder");
+    trial.Expect(!volumes.Claims(volumes.movies()[0].file), "0", "1");
+}
+
+void TellsOfAFolder(Trial& trial) {
+    Volumes volumes(trial);
+    trial.Doing("calling GetVolumeInfo with a folder of movies");
+    const auto path = host::ModulePath(volumes.folder());
+    host::Ref<NMA::IVolumeInfo> info;
+    trial.ExpectSuccess(volumes.volume()->GetVolumeInfo(path.get(), info.Out()));
+    trial.Expect(static_cast<bool>(info), "an object", "null");
+    trial.Doing("asking a volume for its type");
+    ncfUInt32 type = 0;
+    trial.ExpectSuccess(info->GetType(&type));
+    trial.Expect(type == 0 || (type >= 2 && type <= 4), "0, 2, 3 or 4", std::to_string(type));
+    trial.Doing("asking a volume for its serial number and label");
+    ncfUInt32 serial = 0;
+    trial.ExpectSuccess(info->GetSerialNumber(&serial));
+    host::Ref<INCFString> label;
+    trial.ExpectSuccess(info->GetLabel(label.Out()));
+    trial.Expect(static_cast<bool>(label), "a string, which may be empty", "null");
+    trial.Doing("asking a volume for the date of its newest movie");
+    ncfUInt32 date = 0;
+    trial.ExpectSuccess(info->GetModificationDate(&date));
+    trial.Expect(date != 0, "a date, since there are movies", "0");
+}
+
+void FormatListsClips(Trial& trial) {
+    Volumes volumes(trial);
+    trial.Doing("listing the clips of a folder of movies");
+    const auto clips = volumes.ClipsOf(volumes.folder());
+    trial.Expect(clips->GetCount() >= 1, "one clip at least, since the folder is claimed",
+                 std::to_string(clips->GetCount()));
+}
+
+std::filesystem::path PathOfClip(Trial& trial, NMA::IAAFClips* clips, ncfSInt32 index) {
+    host::Ref<host::String> text = host::MakeRef<host::String>();
+    trial.ExpectSuccess(clips->GetClipPath(index, text.get()));
+    std::filesystem::path path;
+    trial.ExpectSuccess(host::PathFrom(text.get(), path), "a path");
+    return path;
+}
+
+void ClipsAreTheFoldersFiles(Trial& trial) {
+    Volumes volumes(trial);
+    const auto clips = volumes.ClipsOf(volumes.folder());
+    std::set<std::filesystem::path> files;
+    for (const SampleMovie& movie : volumes.movies()) {
+        files.insert(movie.file);
+    }
+    for (ncfSInt32 i = 0; i < clips->GetCount(); ++i) {
+        trial.Doing("asking for the path of clip " + std::to_string(i));
+        const std::filesystem::path path = PathOfClip(trial, clips.get(), i);
+        trial.Expect(files.erase(path) == 1, "each clip is another file of the folder",
+                     host::DisplayPath(path));
+    }
+}
+
+void ListRefusesOtherIndexes(Trial& trial) {
+    Volumes volumes(trial);
+    const auto clips = volumes.ClipsOf(volumes.folder());
+    for (const ncfSInt32 index : {clips->GetCount(), -1, 0x7FFFFFFF}) {
+        trial.Doing("asking a folder's list for clip " + std::to_string(index) + " of " +
+                    std::to_string(clips->GetCount()));
+        host::Ref<IAAFFile> file;
+        trial.ExpectResult(NCF_E_NOTFOUND, clips->GetMetadata(index, file.Out()), "NCF_E_NOTFOUND");
+        trial.Expect(!file, "no description comes out", "an object");
+    }
+}
+
+void ListDescribesClips(Trial& trial) {
+    Volumes volumes(trial);
+    const auto clips = volumes.ClipsOf(volumes.folder());
+    for (ncfSInt32 i = 0; i < clips->GetCount(); ++i) {
+        trial.Doing("asking a folder's list for the description of clip " + std::to_string(i));
+        host::Ref<IAAFFile> file;
+        const NCFRESULT result = clips->GetMetadata(i, file.Out());
+        trial.Expect((result >= 0) == static_cast<bool>(file),
+                     "a description with success, or null with a failure",
+                     trial.Text(result) + (file ? ", and an object" : ", and null"));
+    }
+}
+
+void ContainerIdLeadsToAContainer(Trial& trial) {
+    Volumes volumes(trial);
+    trial.Doing("calling GetContainerComponentId");
+    GUID id{};
+    trial.ExpectSuccess(volumes.volume()->GetContainerComponentId(&id));
+    for (const host::ComponentFacts& component : volumes.module().Components()) {
+        if (component.id != id) {
+            continue;
+        }
+        const auto factory = FactoryOf(volumes.module(), component);
+        trial.Expect(static_cast<bool>(factory), "a component that has a class factory",
+                     component.name + " has none");
+        void* out = nullptr;
+        factory->CreateInstance(volumes.module().unknown(), nullptr, NMA::IID_IMediaContainer,
+                                &out);
+        const auto made = host::Ref<INCFUnknown>::Adopt(static_cast<INCFUnknown*>(out));
+        trial.Expect(static_cast<bool>(made), "a component that is an IMediaContainer",
+                     component.name + " is none");
+        return;
+    }
+    trial.Fail("the component id of one of the module's components", "an id that none has");
+}
+
+void GoesOnWithBadFiles(Trial& trial) {
+    Volumes volumes(trial);
+    const std::filesystem::path folder = trial.folder() / "bad";
+    std::filesystem::create_directory(folder);
+    WriteBrokenMovies(folder);
+    WriteHostileMovies(folder);
+    trial.Doing("listing a folder of broken and hostile files");
+    const bool isClaimed = volumes.Claims(folder);
+    if (!isClaimed) {
+        return;  // it looks into the files, and finds no clip
+    }
+    const auto clips = volumes.ClipsOf(folder);
+    for (ncfSInt32 i = 0; i < clips->GetCount(); ++i) {
+        trial.Doing("describing " +
+                    host::DisplayPath(PathOfClip(trial, clips.get(), i).filename()) +
+                    " from a folder's list");
+        host::Ref<IAAFFile> file;
+        const NCFRESULT result = clips->GetMetadata(i, file.Out());
+        trial.Expect((result >= 0) == static_cast<bool>(file),
+                     "a description with success, or null with a failure",
+                     trial.Text(result) + (file ? ", and an object" : ", and null"));
+    }
+}
+
+void ListOutlivesVolume(Trial& trial) {
+    Volumes volumes(trial);
+    const auto clips = volumes.ClipsOf(volumes.folder());
+    volumes.Release();
+    trial.Doing("using a folder's list after its volume's end");
+    trial.Expect(clips->GetCount() >= 1, "its clips are still there",
+                 std::to_string(clips->GetCount()));
+}
+
+}  // namespace
+
+std::vector<Check> VolumeChecks() {
+    static constexpr char kPair[] = "the output is set before the last step has succeeded";
+    return {
+        {"volume-claims-again", "A volume says the same of a folder each time.",
+         "the first answer is kept, or changes something", ClaimsAFolderEachTime},
+        {"volume-other-folders",
+         "A volume answers 0 for an empty folder, for one that is not there and for a file.",
+         "a failure is handed on instead of 0, or the folder is not looked into",
+         LeavesOtherFolders},
+        {"volume-info",
+         "A claimed folder has a volume info with type, serial number, label and date.",
+         "an output is left as it was", TellsOfAFolder},
+        {"volume-format", "A claimed folder has a format that lists one clip at least.",
+         "the claim and the list go by different rules", FormatListsClips},
+        {"volume-clip-paths", "Each clip of a folder's list is another file of that folder.",
+         "paths are joined with another separator than a backslash, or a file is listed twice",
+         ClipsAreTheFoldersFiles},
+        {"volume-clip-index",
+         "A folder's list refuses an index that is not there with NCF_E_NOTFOUND.",
+         "the index is not compared, or as an unsigned number", ListRefusesOtherIndexes},
+        {"volume-clip-descriptions",
+         "A folder's list gives a description with success, and null with a failure.", kPair,
+         ListDescribesClips},
+        {"volume-container-id",
+         "GetContainerComponentId names a component of the module that is a container.",
+         "it gives the class id, or the id of another component", ContainerIdLeadsToAContainer},
+        {"volume-bad-files",
+         "A folder with broken and hostile files is listed, and each of them refused or "
+         "described.",
+         "what stands in a file is used before it is looked at", GoesOnWithBadFiles},
+        {"volume-released-first", "A folder's list goes on when its volume is released.",
+         "the list points into the volume or the format", ListOutlivesVolume},
+    };
+}
+
+}  // namespace validate

@@ -1,0 +1,370 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// `cliphost validate`: it finds each thing that a module can be wrong in, and nothing in modules
+// that are right.
+
+#include <cstdlib>
+#include <fstream>
+#include <nlohmann/json.hpp>
+#include <set>
+
+#include "reference_host/validate/Check.h"
+#include "tests/system/Command.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using nlohmann::json;
+
+std::filesystem::path Faulty(const std::string& name) {
+    return std::filesystem::path(CLIPHOST_FAULTY_MODULES) / (name + ".nvx");
+}
+
+const std::filesystem::path kOurs = ProgramFolder() / "plugins" / "QuickTimePlugin.nvx";
+const std::filesystem::path kMinimal =
+    std::filesystem::path(CLIPHOST_EXAMPLES) / "MinimalModule.nvx";
+
+struct Answer {
+    int status = -1;
+    json value;
+
+    // The check's own part of the answer; null where it was not done.
+    json Of(const std::string& id) const {
+        for (const json& check : value.value("checks", json::array())) {
+            if (check["id"] == id) {
+                return check;
+            }
+        }
+        return {};
+    }
+};
+
+Answer Validate(const std::filesystem::path& module, const std::string& options = "") {
+    const CommandResult ran =
+        RunCliphost("validate " + Quoted(module) + " --seed 1 --json " + options);
+    Answer answer{ran.status, json::parse(ran.out, nullptr, false)};
+    EXPECT_FALSE(answer.value.is_discarded()) << ran.out;
+    return answer;
+}
+
+// How a module that is wrong in what a check looks for is found out.
+struct Row {
+    const char* id;
+    const char* verdict = "failed";
+    const char* module = "FaultyModule";  // else another file
+};
+
+// One for each check. The module is wrong in what the check is called after.
+constexpr Row kRows[] = {
+    {"file-loads", "failed", "text"},
+    {"file-exports-six-functions", "failed", "tiny_file_no_shutdown"},
+    {"file-exports-nothing-else", "warning", "tiny_file_further_export"},
+    {"file-starts-nothing"},
+    {"file-loads-again", "crashed"},
+    {"order-unload-question-first"},
+    {"order-shutdown-without-start"},
+    {"order-registration-after-start"},
+    {"order-start-without-registration"},
+    {"order-start-twice"},
+    {"order-shutdown-twice", "crashed"},
+    {"order-start-again"},
+    {"order-shutdown-with-objects", "crashed"},
+    {"order-other-thread"},
+    {"order-registration-on-two-threads"},
+    {"order-creation-on-threads"},
+    {"order-no-thread"},
+    {"plugin-definition"},
+    {"plugin-names"},
+    {"plugin-id"},
+    {"plugin-versions", "warning"},
+    {"plugin-component-count"},
+    {"component-definitions"},
+    {"component-index-beyond"},
+    {"component-ids"},
+    {"component-class-ids"},
+    {"component-types"},
+    {"component-names"},
+    {"definition-attributes"},
+    {"definition-once", "warning"},
+    {"registration-twice"},
+    {"register-plugin-null"},
+    {"register-component-null"},
+    {"registration-keeps-nothing"},
+    {"refusal-plugin-registration"},
+    {"refusal-component-registration"},
+    {"refusal-definition-calls"},
+    {"refusal-start"},
+    {"refusal-creation"},
+    {"refusal-query", "crashed"},
+    {"factory-offered"},
+    {"factory-unknown-class"},
+    {"factory-null-arguments"},
+    {"factory-unknown-interface"},
+    {"factory-interfaces"},
+    {"factory-kept"},
+    {"factory-refuses-unloading"},
+    {"factory-released-first"},
+    {"create-null-output"},
+    {"create-unknown-interface"},
+    {"create-aggregated-interface"},
+    {"create-aggregated-root"},
+    {"create-aggregated-interfaces"},
+    {"create-by-class-id"},
+    {"create-by-component-id"},
+    {"query-root"},
+    {"query-unknown-interface"},
+    {"query-reflexive"},
+    {"query-symmetric"},
+    {"query-transitive"},
+    {"query-stable"},
+    {"counts-right"},
+    {"counts-end"},
+    {"counts-on-threads"},
+    {"objects-many"},
+    {"unload-null-host"},
+    {"unload-refused"},
+    {"unload-allowed"},
+    {"unload-refused-goes-on"},
+    {"unload-question-only"},
+    {"shutdown-succeeds"},
+    {"shutdown-gives-back"},
+    {"unload-and-load-again"},
+    {"volume-claims-again"},
+    {"volume-other-folders"},
+    {"volume-info"},
+    {"volume-format"},
+    {"volume-clip-paths"},
+    {"volume-clip-index"},
+    {"volume-clip-descriptions"},
+    {"volume-container-id"},
+    {"volume-bad-files", "crashed"},
+    {"volume-released-first"},
+    {"container-file-types", "crashed"},
+    {"container-capabilities"},
+    {"container-path-once"},
+    {"container-path-copied"},
+    {"container-without-path"},
+    {"container-missing-file"},
+    {"container-supports"},
+    {"container-describes-again"},
+    {"container-closes-file"},
+    {"container-leaves-nothing"},
+    {"container-leaves-file"},
+    {"container-threads"},
+    {"container-odd-names"},
+    {"container-creations-refused", "crashed"},
+    {"container-queries-refused", "crashed"},
+    {"description-is-aaf"},
+    {"description-master-mob"},
+    {"description-ids"},
+    {"description-ids-stable"},
+    {"description-ids-differ"},
+    {"description-slots"},
+    {"description-outlives"},
+    {"description-index"},
+    {"mapping-tracks"},
+    {"mapping-samples"},
+    {"mapping-in-file"},
+    {"mapping-other-tracks"},
+    {"mapping-other-samples"},
+    {"mapping-outlives"},
+    {"files-broken", "crashed"},
+    {"files-hostile", "timedOut"},
+    {"files-huge"},
+    {"files-good-after-bad"},
+    {"files-that-change", "crashed"},
+    {"leaks-registration"},
+    {"leaks-start"},
+    {"leaks-objects"},
+    {"leaks-refused-creation"},
+    {"leaks-descriptions"},
+    {"leaks-broken-files"},
+    {"fuzz-calls", "crashed"},
+    {"fuzz-movies", "crashed"},
+};
+
+void PrintTo(const Row& row, std::ostream* out) {
+    *out << row.id;
+}
+
+class Validates : public SystemTest {
+protected:
+    void TearDown() override {
+        unsetenv("CLIPHOST_FAULT");
+        SystemTest::TearDown();
+    }
+    std::filesystem::path Text() {
+        const std::filesystem::path file = folder() / "text.nvx";
+        std::ofstream(file) << "this is no module\n";
+        return file;
+    }
+};
+
+class ValidatesWrongModule : public Validates, public testing::WithParamInterface<Row> {};
+
+TEST_P(ValidatesWrongModule, AndFindsTheFault) {
+    const Row row = GetParam();
+    setenv("CLIPHOST_FAULT", row.id, 1);
+    const auto module = std::string(row.module) == "text" ? Text() : Faulty(row.module);
+    // A module that hangs does so for ever; any limit finds it.
+    const std::string limit = std::string(row.verdict) == "timedOut" ? " --limit-seconds 1" : "";
+    const Answer answer = Validate(module, std::string("--only ") + row.id + limit);
+    EXPECT_EQ(answer.status, std::string(row.verdict) == "warning" ? 0 : 1);
+    const json check = answer.Of(row.id);
+    ASSERT_TRUE(check.is_object()) << answer.value.dump(2);
+    EXPECT_EQ(check["verdict"], row.verdict) << check.dump(2);
+    EXPECT_EQ(answer.value["counts"][row.verdict], 1);
+    for (const char* const told : {"done", "expected", "found", "cause"}) {
+        EXPECT_TRUE(check[told].is_string()) << told << " is missing: " << check.dump(2);
+    }
+    EXPECT_NE(check["again"].get<std::string>().find(std::string("--only ") + row.id),
+              std::string::npos);
+}
+
+INSTANTIATE_TEST_SUITE_P(OfEachKind, ValidatesWrongModule, testing::ValuesIn(kRows),
+                         [](const auto& test) {
+                             std::string name = test.param.id;
+                             std::replace(name.begin(), name.end(), '-', '_');
+                             return name;
+                         });
+
+TEST_F(Validates, EachCheckHasAModuleThatIsWrongInIt) {
+    std::set<std::string> checks;
+    for (const validate::Check& check : validate::AllChecks()) {
+        EXPECT_TRUE(checks.insert(check.id).second) << check.id << " stands there twice";
+    }
+    std::set<std::string> rows;
+    for (const Row& row : kRows) {
+        rows.insert(row.id);
+    }
+    EXPECT_EQ(checks, rows);
+    EXPECT_GE(checks.size(), 60u);
+}
+
+TEST_F(Validates, EachCheckSaysWhatItIsAbout) {
+    for (const validate::Check& check : validate::AllChecks()) {
+        SCOPED_TRACE(check.id);
+        EXPECT_EQ(std::string(check.id).find_first_not_of("abcdefghijklmnopqrstuvwxyz-"),
+                  std::string::npos);
+        EXPECT_EQ(std::string(check.text).back(), '.');
+        EXPECT_NE(std::string(check.cause), "");
+    }
+}
+
+// The counts of a whole run; what did not pass is told.
+json CountsOf(const std::filesystem::path& module) {
+    const Answer answer =
+        Validate(module, "--limit-seconds 100000");  // however slow the machine is
+    for (const json& check : answer.value.value("checks", json::array())) {
+        EXPECT_TRUE(check["verdict"] == "passed" || check["verdict"] == "skipped") << check.dump(2);
+    }
+    EXPECT_EQ(answer.status, 0);
+    return answer.value.value("counts", json::object());
+}
+
+TEST_F(Validates, AndPassesTheModuleThatHasNoFault) {
+    EXPECT_EQ(CountsOf(Faulty("FaultyModule"))["passed"], std::size(kRows));
+}
+
+TEST_F(Validates, AndPassesThePlugin) {
+    EXPECT_EQ(CountsOf(kOurs)["passed"], std::size(kRows));
+}
+
+TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
+    const json counts = CountsOf(kMinimal);
+    std::size_t media = 2;  // it makes objects that can't be aggregated
+    for (const Row& row : kRows) {
+        const std::string id = row.id;
+        for (const char* const group :
+             {"volume-", "container-", "description-", "mapping-", "files-"}) {
+            media += id.rfind(group, 0) == 0 ? 1 : 0;
+        }
+    }
+    media += 3;  // leaks-descriptions, leaks-broken-files, fuzz-movies
+    EXPECT_EQ(counts["skipped"], media);
+    EXPECT_EQ(counts["passed"], std::size(kRows) - media);
+}
+
+TEST_F(Validates, AFileThatIsNoModuleByOneCheckAndSkipsTheRest) {
+    const Answer answer = Validate(Text());
+    EXPECT_EQ(answer.status, 1);
+    EXPECT_EQ(answer.Of("file-loads")["verdict"], "failed");
+    EXPECT_EQ(answer.value["counts"]["failed"], 1);
+    EXPECT_EQ(answer.value["counts"]["skipped"], std::size(kRows) - 1);
+}
+
+TEST_F(Validates, AndTellsWhatTheCallerDidWrong) {
+    const CommandResult absent = RunCliphost("validate " + Quoted(folder() / "absent.nvx"));
+    ExpectSays(absent, 2, "absent.nvx");
+    ExpectSays(RunCliphost("validate " + Quoted(folder())), 2, "folder");
+    ExpectSays(RunCliphost("validate " + Quoted(kMinimal) + " --only no-such-check"), 2,
+               "there is no such check; cliphost validate --list names all of them");
+    ExpectSays(RunCliphost("validate"), 2, "no module is given");
+    ExpectSays(RunCliphost("validate " + Quoted(kMinimal) + " --seed many"), 2, "--seed");
+}
+
+TEST_F(Validates, AndListsItsChecks) {
+    const CommandResult listed = RunCliphost("validate --list");
+    for (const Row& row : kRows) {
+        ExpectSays(listed, 0, std::string(row.id) + "\n    ");
+    }
+    ExpectSays(listed, 0, std::to_string(std::size(kRows)) + " checks\n");
+    ExpectSays(RunCliphost("validate --list --only plugin-id"), 0, "plugin-id\n    ");
+    ExpectSays(RunCliphost("validate --list --only plugin-id"), 0, "1 check\n");
+}
+
+TEST_F(Validates, AndItsLastLineCounts) {
+    setenv("CLIPHOST_FAULT", "plugin-names", 1);
+    const CommandResult ran = RunCliphost("validate " + Quoted(Faulty("FaultyModule")) +
+                                          " --only plugin-names --only plugin-id");
+    ExpectSays(ran, 1,
+               "2 checks: 1 passed, 1 failed, 0 crashed, 0 timed out, 0 warning, 0 skipped\n");
+    ExpectSays(ran, 1, "failed     plugin-names\n");
+    ExpectSays(ran, 1, "found     the name is empty\n");
+    ExpectSays(ran, 1, "--only plugin-names\n");
+}
+
+TEST_F(Validates, AndTheSeedDoesTheSameAgain) {
+    setenv("CLIPHOST_FAULT", "fuzz-calls", 1);
+    const std::string call =
+        "validate " + Quoted(Faulty("FaultyModule")) + " --only fuzz-calls --seed 7";
+    const CommandResult first = RunCliphost(call);
+    ExpectSays(first, 1, "seed 7\n");
+    ExpectSays(first, 1, "--only fuzz-calls --seed 7\n");
+    EXPECT_EQ(RunCliphost(call).out, first.out);
+}
+
+TEST_F(Validates, AndACrashCostsOneCheckAlone) {
+    setenv("CLIPHOST_FAULT", "order-shutdown-twice", 1);
+    const Answer answer = Validate(
+        Faulty("FaultyModule"), "--only plugin-id --only order-shutdown-twice --only plugin-names");
+    EXPECT_EQ(answer.Of("plugin-id")["verdict"], "passed");
+    EXPECT_EQ(answer.Of("order-shutdown-twice")["verdict"], "crashed");
+    EXPECT_EQ(answer.Of("order-shutdown-twice")["done"], "calling NCFShutdown a second time");
+    EXPECT_EQ(answer.Of("plugin-names")["verdict"], "passed");
+}
+
+TEST_F(Validates, AndDoesItInItsOwnProcessForADebugger) {
+    const Answer answer =
+        Validate(kMinimal, "--in-process --only plugin-id --only create-by-class-id");
+    EXPECT_EQ(answer.status, 0);
+    EXPECT_EQ(answer.value["counts"]["passed"], 2);
+    setenv("CLIPHOST_FAULT", "order-shutdown-twice", 1);
+    const CommandResult crashed = RunCliphost("validate " + Quoted(Faulty("FaultyModule")) +
+                                              " --in-process --only order-shutdown-twice");
+    EXPECT_NE(crashed.status, 0);
+    EXPECT_NE(crashed.status, 1) << "the crash ends the program: " << crashed.out;
+}
+
+TEST_F(Validates, AndLeavesNoFilesBehind) {
+    const std::filesystem::path scratch = folder() / "scratch";
+    std::filesystem::create_directory(scratch);
+    const CommandResult ran =
+        RunCommand("TMPDIR=" + Quoted(scratch) + " " + Quoted(ProgramFolder() / "cliphost") +
+                   " validate " + Quoted(kOurs) + " --only files-huge --only container-odd-names");
+    ExpectSays(ran, 0, "2 checks: 2 passed");
+    EXPECT_TRUE(std::filesystem::is_empty(scratch));
+}
+
+}  // namespace
