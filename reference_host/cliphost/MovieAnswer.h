@@ -18,7 +18,8 @@ namespace cliphost {
 // How descriptions are shown and saved.
 struct DescriptionForm {
     bool json = false;
-    bool lines = false;  // JSON of one line for each movie
+    bool hasNumbers = false;  // in the JSON, besides texts
+    bool lines = false;       // JSON of one line for each movie
     bool quiet = false;
     PathMaps maps;                                // of the locators
     std::filesystem::path columnsFile;            // a table of columns to write; empty: none

@@ -23,6 +23,7 @@ void AddDump(CLI::App& app, const SessionOptions& session);
 void AddVerify(CLI::App& app, const SessionOptions& session, int& status);
 void AddRelink(CLI::App& app, const SessionOptions& session, int& status);
 void AddCatalog(CLI::App& app, const SessionOptions& session, int& status);
+void AddReport(CLI::App& app, const SessionOptions& session, int& status);
 void AddFind(CLI::App& app, int& status);
 void AddHelpFiles(CLI::App& app);
 void AddPlugin(CLI::App& app, const SessionOptions& session, int& status);
