@@ -107,12 +107,8 @@ Json Kept(Json given, const Json& shape) {
 Json ClipFrom(const std::string& json) {
     static const Json shape = Json::parse(kShape);
     Json given = Json::parse(json, nullptr, false);
-    Json clip = Kept(given.is_object() ? std::move(given) : Json::object(), shape);
-    for (const char* const part : {"facts", "details"}) {
-        if (!clip.contains(part)) {
-            clip[part] = Json::object();
-        }
-    }
+    Json clip = {{"facts", Json::object()}, {"details", Json::object()}};
+    clip.update(Kept(given.is_object() ? std::move(given) : Json::object(), shape));
     return clip;
 }
 

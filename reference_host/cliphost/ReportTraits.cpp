@@ -8,6 +8,7 @@
 #include <cmath>
 #include <nlohmann/json.hpp>
 #include <string_view>
+#include <utility>
 
 #include "reference_host/quicktime/DisplayMatrix.h"
 
@@ -74,8 +75,9 @@ std::string DurationsText(const Track& track) {
         shortest = std::min(shortest, times.DurationOf(i));
         longest = std::max(longest, times.DurationOf(i));
     }
-    // Rates such as 30000/1001 in a scale that they don't divide.
-    if (longest - shortest <= 1) {
+    // Rates such as 30000/1001 in a scale that they don't divide, rounded this way or that.
+    constexpr ncfUInt64 kRoundings = 50;
+    if ((longest - shortest) * kRoundings <= longest) {
         return {};
     }
     const auto milliseconds = [&](ncfUInt32 duration) {
@@ -126,6 +128,24 @@ void AddPictureFacts(const Track& track, Json& facts) {
     }
 }
 
+// What the module writes when it serves media, and how its reasons begin; it writes of other
+// things, too.
+constexpr std::string_view kServed = "Forcing sample provider mode for ";
+constexpr std::string_view kReasons[] = {"The movie ", "The FOURCC ",          "The audio ",
+                                         "An audio ",  "More than one video ", "Video is "};
+// It has a reason for each of these that it doesn't tell.
+constexpr std::string_view kVideo = "video";
+constexpr char kNoRecord[] = "the data files have no whole record of its codec";
+constexpr char kNotLinear[] = "it is no linear PCM";
+
+bool BeginsWith(std::string_view text, std::string_view start) {
+    return text.substr(0, start.size()) == start;
+}
+bool BeginsAsReason(std::string_view text) {
+    return std::any_of(std::begin(kReasons), std::end(kReasons),
+                       [&](std::string_view start) { return BeginsWith(text, start); });
+}
+
 }  // namespace
 
 void AddTrait(const char* id, std::string words, Json& facts) {
@@ -160,30 +180,26 @@ void AddHeaderFacts(const std::filesystem::path& movie, const header_parser::Hea
 }
 
 std::vector<ServedMedia> MediaServed(const std::vector<std::string>& notices) {
-    constexpr std::string_view kStart = "Forcing sample provider mode for ";
     std::vector<ServedMedia> served;
-    std::vector<std::string> reasons;
+    std::string reason;
     for (const std::string& notice : notices) {
-        if (notice.compare(0, kStart.size(), kStart) != 0) {
-            reasons.push_back(notice);
-            continue;
+        if (BeginsAsReason(notice)) {
+            reason = notice;
+        } else if (BeginsWith(notice, kServed)) {
+            std::string what = notice.substr(kServed.size());
+            what.erase(what.find_last_not_of(".\n") + 1);
+            if (reason.empty()) {
+                reason = what == kVideo ? kNoRecord : kNotLinear;
+            }
+            served.push_back({std::move(what), std::exchange(reason, {})});
         }
-        std::string what = notice.substr(kStart.size());
-        while (!what.empty() && (what.back() == '.' || what.back() == '\n')) {
-            what.pop_back();
-        }
-        served.push_back({std::move(what), std::move(reasons)});
-        reasons.clear();
     }
     return served;
 }
 
 void AddServedMedia(const std::vector<ServedMedia>& served, Json& facts) {
     for (const ServedMedia& one : served) {
-        const std::string why = one.reasons.empty()
-                                    ? "the data files have no whole record of its codec"
-                                    : one.reasons.back();
-        AddTrait(trait::kProvider, fmt::format("{}: {}", one.what, why), facts);
+        AddTrait(trait::kProvider, fmt::format("{}: {}", one.what, one.reason), facts);
     }
 }
 

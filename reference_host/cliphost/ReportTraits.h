@@ -34,7 +34,7 @@ void AddHeaderFacts(const std::filesystem::path& movie, const header_parser::Hea
 // user while it described a movie.
 struct ServedMedia {
     std::string what;  // "video", "audio track 1"
-    std::vector<std::string> reasons;
+    std::string reason;
 };
 std::vector<ServedMedia> MediaServed(const std::vector<std::string>& notices);
 void AddServedMedia(const std::vector<ServedMedia>& served, nlohmann::ordered_json& facts);

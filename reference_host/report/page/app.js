@@ -3,6 +3,8 @@
 
 // Which view is shown: the part of the address behind # says it.
 
+history.scrollRestoration = 'manual';
+
 const main = document.getElementById('main');
 const table = makeTable();
 let scrolled = 0;
@@ -54,6 +56,8 @@ function show() {
   main.replaceChildren(table.view);
   document.title = shown(report.title);
   table.show();
+// For whoever measures how long it takes until the page can be used.
+requestAnimationFrame(() => setTimeout(() => performance.mark('usable')));
   scrollTo(0, scrolled);
   if (lastClip) table.focusClip(lastClip);
   lastClip = null;
@@ -74,3 +78,5 @@ addEventListener('keydown', (event) => {
   }
 });
 show();
+// For whoever measures how long it takes until the page can be used.
+requestAnimationFrame(() => setTimeout(() => performance.mark('usable')));

@@ -39,7 +39,7 @@ function sampleFacts(samples) {
         ['Pictures between those that stand alone', track.sizes ? groupsText(track.groups) : undefined],
       ]),
       track.faults.map((fault) => el('p', {class: 'warning'}, fault)),
-      track.sizes && track.sizes.length ? sizeChart(track) : '');
+      track.sizes && track.sizes.length > 1 ? sizeChart(track) : '');
   }
   box.append(...interleaving(samples.interleaving));
   return box;

@@ -23,7 +23,7 @@ const CHIP_KINDS = [
    of: (clip) => [clip.failed ? 'Not described' : clip.warnings.length ? 'Warnings' : '',
                   ...clip.traits.map((trait) => TRAIT_NAMES[trait.id] || trait.id)]},
 ];
-const MOST_CHIPS = 12;  // of a kind
+const MOST_CHIPS = 8;  // of a kind
 
 // `numbers`: clips of a group come together; those without one come last.
 const GROUPINGS = [
@@ -52,7 +52,7 @@ const COLUMNS = [
   {id: 'length', title: 'Length', number: true, order: byNumber((clip) => clip.seconds),
    text: (clip) => durationText(clip.seconds)},
   {id: 'start', title: 'Timecode', order: byText((clip) => clip.start),
-   text: (clip) => clip.start || ''},
+   text: (clip) => clip.hasTimecode === false ? '' : clip.start || ''},
   {id: 'rate', title: 'Rate', number: true, order: byNumber((clip) => ratio(clip.rate) || undefined),
    text: (clip) => rateText(clip.rate)},
   {id: 'raster', title: 'Raster', number: true,

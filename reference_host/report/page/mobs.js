@@ -23,7 +23,7 @@ function played(slot) {
 
 function slotBox(slot, mobs) {
   const segment = played(slot);
-  const kind = plainText(segment.DataDefinition).replace(/^Legacy/, '');
+  const kind = plainText(segment.DataDefinition).replace(/^DataDef_/, '').replace(/^Legacy/, '').replace(/ \{.*$/, '');
   const target = mobs.findIndex((mob) => mob.MobID === segment.SourceID);
   const isDrop = String(segment.Drop).startsWith('True');
   const rows = [['Edit rate', slot.EditRate], ['Length', segment.Length]];

@@ -42,7 +42,7 @@ function durationText(seconds) {
                       : Math.floor(minutes / 60) + ':' + two(minutes % 60) + ':' + two(whole % 60);
 }
 
-const UNITS = ['bytes', 'kB', 'MB', 'GB', 'TB'];
+const UNITS = ['B', 'kB', 'MB', 'GB', 'TB'];
 function bytesText(bytes) {
   if (bytes === undefined) return '';
   let unit = 0;

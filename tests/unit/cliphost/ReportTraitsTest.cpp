@@ -11,7 +11,7 @@ using cliphost::MediaServed;
 namespace {
 
 std::string Told(const std::vector<std::string>& notices) {
-    nlohmann::ordered_json facts;
+    nlohmann::ordered_json facts = nlohmann::ordered_json::object();
     cliphost::AddServedMedia(MediaServed(notices), facts);
     std::string text;
     for (const auto& trait : facts.value("traits", nlohmann::ordered_json::array())) {
@@ -27,9 +27,11 @@ TEST(ServedMediaOfMovies, AreToldWithTheReasonBeforeThem) {
               "video: The movie contains alpha.; audio track 2: An audio bit rate of 8 was found.");
 }
 
-TEST(ServedMediaOfMovies, AreForTheirCodecWhereNothingElseIsTold) {
-    EXPECT_EQ(Told({"Forcing sample provider mode for video.", "Something after it"}),
-              "video: the data files have no whole record of its codec");
+TEST(ServedMediaOfMovies, AreForTheirCodecWhereNoReasonIsTold) {
+    EXPECT_EQ(Told({"Forcing sample provider mode for video.", "Color primaries unavailable",
+                    "Forcing sample provider mode for audio track 2."}),
+              "video: the data files have no whole record of its codec; audio track 2: it is no "
+              "linear PCM");
 }
 
 TEST(ServedMediaOfMovies, AreNoneWhereTheModuleTellsNothing) {
