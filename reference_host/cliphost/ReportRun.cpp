@@ -119,7 +119,7 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
     if (options.isSplit) {
         folder_ = file;
         folder_.replace_filename(file.stem().native() + kEndingOfFolder);
-        std::filesystem::create_directories(folder_);
+        madeFolder_.emplace(folder_);
     }
     page_.emplace(
         [this](std::string_view text) {
@@ -153,6 +153,10 @@ std::optional<catalog::Entry> ReportRun::EntryInCatalogs(const std::filesystem::
 }
 
 void ReportRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    std::error_code ignored;
+    if (std::filesystem::is_directory(movie, ignored)) {
+        return;  // of movies, there are none in it
+    }
     const auto known = EntryInCatalogs(movie);
     Json clip =
         known ? ClipOf(*known) : Json{{"facts", Json::object()}, {"details", Json::object()}};

@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/MovieCodecs.h"
 #include "reference_host/cliphost/MoviesRun.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PathMaps.h"
 #include "reference_host/report/Page.h"
 
@@ -61,6 +62,7 @@ private:
     CodecReader codecs_;
     bool takesPlace_ = false;
     std::filesystem::path folder_;  // of pictures; empty: they are in the page
+    std::optional<OutputFolder> madeFolder_;
     std::optional<OutputFile> output_;
     std::optional<report::Page> page_;
     std::uint64_t written_ = 0;

@@ -189,7 +189,8 @@ TEST_F(Reports, TellWhatIsOddTogether) {
     Copy("timecode_25.mov", "in/b.mov");
     Copy("timecode_2997_drop.mov", "in/c.mov");
     std::set<std::string> ids;
-    for (const Json& finding : Report("in")["odd"]) {
+    const Json report = Report("in");
+    for (const Json& finding : report["odd"]) {
         ids.insert(finding["id"].get<std::string>());
         if (finding["id"] == "copies") {
             EXPECT_EQ(finding["groups"][0]["clips"].dump(), "[0,1]");
