@@ -187,9 +187,7 @@ void AddSounds(Essence& essence, Json& facts, Json& details) {
 }
 
 void AddSamples(Essence& essence, Json& facts, Json& details) {
-    std::error_code ignored;
-    Json samples = ReadReportSamples(essence.map(), essence.tracks(),
-                                     std::filesystem::file_size(essence.movie(), ignored));
+    Json samples = ReadReportSamples(essence);
     const auto apart = samples.find("interleaving");
     if (apart != samples.end() && !(*apart)["breaks"].empty()) {
         AddTrait(trait::kNotInterleaved,

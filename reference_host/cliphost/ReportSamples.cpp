@@ -103,13 +103,20 @@ std::vector<PlacedRun> InFileOrder(const std::vector<PlayedRuns>& tracks) {
     for (std::size_t i = 0; i < tracks.size(); ++i) {
         const double rate = tracks[i].rate;
         for (const SampleRun& run : tracks[i].runs) {
-            all.push_back({run.position, i, static_cast<double>(run.first) / rate,
-                           static_cast<double>(run.first + run.count) / rate});
+            const double begin = tracks[i].begin + static_cast<double>(run.first) / rate;
+            all.push_back({run.position, i, begin, begin + static_cast<double>(run.count) / rate});
         }
     }
     std::sort(all.begin(), all.end(),
               [](const PlacedRun& a, const PlacedRun& b) { return a.position < b.position; });
     return all;
+}
+
+// How far what begins now is from where another track has been read to. Behind the other's end
+// nothing is needed of it, and before its first sample only what is played already.
+double GapBetween(double begin, double reached, double end, bool hasBegun) {
+    const double gap = begin >= end ? 0 : begin - reached;
+    return hasBegun ? std::abs(gap) : std::max(0.0, gap);
 }
 
 double ToHundredths(double seconds) {
@@ -119,7 +126,13 @@ double ToHundredths(double seconds) {
 }  // namespace
 
 Json Interleaving(const std::vector<PlayedRuns>& tracks) {
-    std::vector<double> reached(tracks.size(), 0.0);
+    std::vector<double> reached;
+    std::vector<double> ends;
+    std::vector<bool> hasBegun(tracks.size(), false);
+    for (const PlayedRuns& track : tracks) {
+        reached.push_back(track.begin);
+        ends.push_back(track.begin + static_cast<double>(track.samples) / track.rate);
+    }
     double widest = 0;
     bool isApart = false;
     Json breaks = Json::array();
@@ -127,15 +140,14 @@ Json Interleaving(const std::vector<PlayedRuns>& tracks) {
         double gap = 0;
         std::size_t from = run.track;
         for (std::size_t other = 0; other < tracks.size(); ++other) {
-            const double end = static_cast<double>(tracks[other].samples) / tracks[other].rate;
-            // What is played behind the end of the other track needs nothing of it.
-            const double now = run.begin >= end ? 0 : std::abs(reached[other] - run.begin);
+            const double now = GapBetween(run.begin, reached[other], ends[other], hasBegun[other]);
             if (other != run.track && now > gap) {
                 gap = now;
                 from = other;
             }
         }
         reached[run.track] = run.end;
+        hasBegun[run.track] = true;
         widest = std::max(widest, gap);
         const bool wasApart = isApart;
         isApart = gap > kReadAhead;
@@ -150,27 +162,59 @@ Json Interleaving(const std::vector<PlayedRuns>& tracks) {
     return {{"widest", ToHundredths(widest)}, {"breaks", std::move(breaks)}};
 }
 
-Json ReadReportSamples(NMA::ISampleMapping& map, const std::vector<ClipTrack>& tracks,
-                       std::uint64_t fileSize) {
+MediaTime MediaTimeOf(const header_parser::HeaderReport& header, const WhichTrack& which,
+                      const ClipTrack& track) {
+    const header_parser::Track* const found = Find(header, which).track;
+    if (!found || found->mediaTimeScale == 0 || header.movie->timeScale == 0) {
+        return {0, static_cast<double>(track.length) / track.RateAsNumber()};
+    }
+    const header_parser::EditList& edits = found->edits;
+    const header_parser::EditList::Scales scales{header.movie->timeScale, found->mediaTimeScale};
+    const double seconds = static_cast<double>(found->samples.Times().TotalDuration()) /
+                           static_cast<double>(found->mediaTimeScale);
+    if (edits.IsEmpty()) {
+        return {0, seconds};
+    }
+    // Behind the pause that may stand at the beginning.
+    ncfUInt64 first = 0;
+    for (ncfUInt64 end = edits.Duration(); first < end;) {
+        const ncfUInt64 middle = first + (end - first) / 2;
+        if (edits.MediaTimeAt(middle, scales) < 0) {
+            first = middle + 1;
+        } else {
+            end = middle;
+        }
+    }
+    const ncfSInt64 mediaTime = std::max<ncfSInt64>(0, edits.MediaTimeAt(first, scales));
+    return {static_cast<double>(first) / static_cast<double>(scales.movie) -
+                static_cast<double>(mediaTime) / static_cast<double>(scales.media),
+            seconds};
+}
+
+Json ReadReportSamples(const Essence& essence) {
+    std::error_code ignored;
+    const std::uint64_t fileSize = std::filesystem::file_size(essence.movie(), ignored);
+    const header_parser::HeaderReport header = header_parser::InspectHeaders(essence.movie());
     Json list = Json::array();
     std::vector<PlayedRuns> played;
-    for (const ClipTrack& track : tracks) {
+    for (const ClipTrack& track : essence.tracks()) {
         if (track.kind == TrackKind::Alpha) {
             continue;  // its samples are those of the picture
         }
-        RunMap runs = ReadRuns(map, track.number, fileSize);
+        RunMap runs = ReadRuns(essence.map(), track.number, fileSize);
         host::Check(runs.result);
         Json json = {{"track", track.number},    {"kind", NameOf(track.kind)},
                      {"samples", runs.samples},  {"bytes", runs.bytes},
                      {"runs", runs.runs.size()}, {"faults", runs.faults}};
         if (track.kind == TrackKind::Picture && runs.samples > 0 && runs.samples <= kMostSamples) {
-            AddSizes(map, track, runs.samples, json);
+            AddSizes(essence.map(), track, runs.samples, json);
         }
         list.push_back(std::move(json));
-        if (track.RateAsNumber() > 0 && track.length > 0 && runs.samples > 0) {
-            const double seconds = static_cast<double>(track.length) / track.RateAsNumber();
-            played.push_back({track.number, static_cast<double>(runs.samples) / seconds,
-                              runs.samples, std::move(runs.runs)});
+        const MediaTime time = MediaTimeOf(header, essence.Which(track), track);
+        if (time.length > 0 && runs.samples > 0) {
+            played.push_back({track.number, time.begin,
+                              static_cast<double>(runs.samples) / time.length, runs.samples,
+                              std::move(runs.runs)});
         }
     }
     Json json = {{"tracks", std::move(list)}};

@@ -13,7 +13,7 @@ namespace {
 
 // Runs of a second of each track, in the order of `tracks`, which names them by their numbers.
 std::vector<PlayedRuns> Seconds(const std::vector<ncfUInt32>& tracks) {
-    std::vector<PlayedRuns> played = {{0, 25, 0, {}}, {1, 48000, 0, {}}};
+    std::vector<PlayedRuns> played = {{0, 0, 25, 0, {}}, {1, 0, 48000, 0, {}}};
     std::uint64_t position = 100;
     for (const ncfUInt32 track : tracks) {
         PlayedRuns& one = played[track];
@@ -50,6 +50,17 @@ TEST(InterleavingOfSamples, NeedsNothingOfATrackThatHasEnded) {
     const auto found = Interleaving(Seconds({0, 1, 1, 1, 1, 1, 1}));
     EXPECT_EQ(found["widest"], 1.0);
     EXPECT_TRUE(found["breaks"].empty());
+}
+
+// As with a pause at its beginning.
+TEST(InterleavingOfSamples, CountsWhenEachTrackIsPlayed) {
+    std::vector<PlayedRuns> late = Seconds({0, 0, 0, 0, 1, 0, 1, 0, 1});
+    EXPECT_EQ(Interleaving(late)["widest"], 4.0);
+    late[1].begin = 4;
+    EXPECT_EQ(Interleaving(late)["widest"], 1.0);
+    late = Seconds({1, 0, 1, 0});
+    late[1].begin = -1;
+    EXPECT_EQ(Interleaving(late)["widest"], 1.0);
 }
 
 TEST(InterleavingOfSamples, TellsTheFirstBreaksAlone) {
