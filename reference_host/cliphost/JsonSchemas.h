@@ -17,6 +17,7 @@ inline constexpr char kRelink[] = "relink/1.0";
 inline constexpr char kContactLine[] = "contact_line/1.0";
 inline constexpr char kCatalogLine[] = "catalog_line/1.0";
 inline constexpr char kFind[] = "find/1.0";
+inline constexpr char kReport[] = "report/1.0";
 inline constexpr char kTypes[] = "types/1.0";
 inline constexpr char kParams[] = "params/1.0";
 inline constexpr char kPlugin[] = "plugin/1.0";

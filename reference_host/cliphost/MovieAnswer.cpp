@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/MovieAnswer.h"
 
 #include <algorithm>
+#include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/AafLocators.h"
 #include "reference_host/cliphost/AafTree.h"
@@ -142,7 +143,8 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     }
     answer.status = static_cast<int>(status);
     if (form.json) {
-        return status != kExitFine || IsJsonOfTexts(answer.description);
+        return status != kExitFine || (form.hasNumbers ? nlohmann::json::accept(answer.description)
+                                                       : IsJsonOfTexts(answer.description));
     }
     answer.description = host::text::PrintableLines(answer.description);
     return true;

@@ -17,7 +17,8 @@ namespace cliphost {
 // How descriptions are shown and saved.
 struct DescriptionForm {
     bool json = false;
-    bool lines = false;  // JSON of one line for each movie
+    bool hasNumbers = false;  // in the JSON, besides texts
+    bool lines = false;       // JSON of one line for each movie
     bool quiet = false;
     PathMaps maps;                     // of the locators
     GivenColumns columns;              // to be written into descriptions

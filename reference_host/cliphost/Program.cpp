@@ -121,6 +121,7 @@ int Run(int argc, char** argv) {
     AddRelink(app, session, status);
     AddCatalog(app, session, status);
     AddFind(app, status);
+    AddReport(app, session, status);
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);

@@ -24,6 +24,7 @@ void AddCompare(CLI::App& app, const SessionOptions& session, int& status);
 void AddVerify(CLI::App& app, const SessionOptions& session, int& status);
 void AddRelink(CLI::App& app, const SessionOptions& session, int& status);
 void AddCatalog(CLI::App& app, const SessionOptions& session, int& status);
+void AddReport(CLI::App& app, const SessionOptions& session, int& status);
 void AddFind(CLI::App& app, int& status);
 void AddCheckData(CLI::App& app, const SessionOptions& session, int& status);
 void AddValidate(CLI::App& app, const SessionOptions& session, int& status);
