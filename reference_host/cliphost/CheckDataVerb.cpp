@@ -91,7 +91,9 @@ int CheckDataFiles(const std::filesystem::path& folder, bool json, int verbosity
     const int status = std::max(TellUnreadable(checked, folder, unreadable, verbosity),
                                 checked.counts.findings > 0 ? kExitFile : kExitFine);
     if (!json) {
-        PrintFindings(checked, folder);
+        if (unreadable.size() < std::size(checked.unreadable)) {
+            PrintFindings(checked, folder);
+        }
         return status;
     }
     ordered_json findings = ordered_json::array();

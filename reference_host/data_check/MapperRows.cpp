@@ -14,8 +14,8 @@ constexpr NumberRule kVcid = {"vcid", [](std::uint32_t id) { return id != 0; },
 
 std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryReader& reader,
                                  Findings& findings) {
+    reader.CheckNames(entry, {"FourChar", "Vendor", "vcid"});  // the module passes over others
     const std::size_t before = findings.count();
-    reader.CheckNames(entry, {"FourChar", "Vendor", "vcid"});
     reader.CheckBlanks(entry);
     MapperRow row;
     row.place = entry.place;

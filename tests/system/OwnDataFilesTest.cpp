@@ -171,8 +171,10 @@ TEST_F(AddedCodec, IsLookedForInAFolderThatHasBothFiles) {
     std::filesystem::remove(Place("AAFInfo.xml"));
     const CommandResult lacks = CheckData();
     ExpectSays(lacks, 2, "AAFInfo.xml: there is no such file or folder; give a folder that has");
+    std::filesystem::remove(Place("FourCharMapper.xml"));
+    EXPECT_EQ(CheckData().out.find("findings"), std::string::npos) << "nothing was looked at";
     ExpectSays(RunCliphost("check-data " + Quoted(folder() / "none")), 2, "there is no such file");
-    ExpectSays(RunCliphost("check-data " + Quoted(Place("FourCharMapper.xml"))), 2, "be listed");
+    ExpectSays(RunCliphost("check-data " + Quoted(Place("QuickTimePlugin.nvx"))), 2, "be listed");
 }
 
 }  // namespace

@@ -340,6 +340,13 @@ TEST_F(DataChecks, TellNothingThatFollowsFromAnotherMistake) {
                 ElementsAre(HasSubstr("FourChar must have four characters")));
 }
 
+// A name that the module passes over leaves the rest of its row as it is.
+TEST_F(DataChecks, TellWhatIsWrongWithARowBesideAnUnknownName) {
+    EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10001' vendor='x'")),
+                AllOf(Contains(HasSubstr("vendor means nothing here")),
+                      Contains(HasSubstr("leads to id 10001, which has no record"))));
+}
+
 TEST_F(DataChecks, TellWhereAFileIsNotWellFormedAndCheckTheOther) {
     const CheckedData checked =
         CheckFiles("<Map>\n" + Row("dvc ", "vcid='0'") + "</Map>", "<Infos>\n  <a>\n</Infos>");
