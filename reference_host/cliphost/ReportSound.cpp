@@ -47,7 +47,7 @@ private:
 
 int StepsOf(double level) {
     // The least sound is not nothing.
-    return level > 0 ? std::max(1, static_cast<int>(std::lround(level * 255))) : 0;
+    return level > 0 ? std::max(1, static_cast<int>(std::lround(std::sqrt(level) * 255))) : 0;
 }
 
 }  // namespace

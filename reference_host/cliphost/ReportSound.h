@@ -9,8 +9,9 @@
 namespace cliphost {
 
 // How loud a sound track is over its length: the highest and the mean level of each column of a
-// chart, over all channels, in steps of 1/255 of the most. Of long sound each column tells what a
-// piece at its beginning holds. Throws a Failure.
+// chart, over all channels. A column has 255 times the square root of a level of 1 at most, so that
+// quiet sound is seen, too. Of long sound each column tells what a piece at its beginning holds.
+// Throws a Failure.
 nlohmann::ordered_json ReadWave(Essence& essence, const ClipTrack& track);
 
 }  // namespace cliphost

@@ -3,6 +3,7 @@
 
 // What `report` tells of movies, what it writes, and what becomes of it where it can't.
 
+#include <cmath>
 #include <fstream>
 #include <nlohmann/json.hpp>
 #include <set>
@@ -164,8 +165,9 @@ TEST_F(Reports, TellHowLoudSoundIs) {
                     "sine.mov"))["details"]["waves"][0];
     EXPECT_NEAR(wave["highest"].get<double>(), -18.06, 0.02);
     EXPECT_EQ(wave["peaks"].size(), 240u);
-    EXPECT_NEAR(wave["peaks"][100].get<int>(), 255 / 8, 1);
-    EXPECT_NEAR(wave["means"][100].get<int>(), 255 / 8 * 0.707, 2);
+    EXPECT_NEAR(wave["peaks"][100].get<int>(), 255 * std::sqrt(1 / 8.0), 1);
+    // A column holds no whole number of waves.
+    EXPECT_NEAR(wave["means"][100].get<int>(), 255 * std::sqrt(std::sqrt(0.5) / 8), 3);
     EXPECT_NEAR(wave["seconds"].get<double>(), 1.0, 0.05);
 }
 

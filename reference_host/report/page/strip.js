@@ -3,6 +3,12 @@
 
 // Pictures from the whole movie, which are one picture: each cell shows a part of it.
 
+// As many in a row that rows are full, and none is much smaller than it is stored.
+const STRIP_COLUMNS = [12, 6, 4, 3, 2];
+function columnsFor(width, cell) {
+  return STRIP_COLUMNS.find((columns) => width / columns >= 0.8 * cell) || 2;
+}
+
 function filmstrip(strip) {
   const source = sourceOf(strip);
   const count = strip.frames.length;
@@ -21,6 +27,9 @@ function filmstrip(strip) {
         frame.timecode ? el('span', {class: 'fine'}, 'frame ' + frame.frame) : ''),
       frame.problem ? el('p', {class: 'fine'}, frame.problem) : ''));
   });
-  list.style.setProperty('--cell', Math.round(strip.width) + 'px');
+  list.style.setProperty('--cell', strip.width + 'px');
+  new ResizeObserver(() => {
+    list.style.setProperty('--columns', columnsFor(list.clientWidth, strip.width));
+  }).observe(list);
   return roving(list, '.value');
 }
