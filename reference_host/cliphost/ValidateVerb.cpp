@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cctype>
 #include <map>
 #include <memory>
 #include <random>
@@ -16,7 +17,6 @@
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/cliphost/WorkerOptions.h"
-#include "reference_host/framework/HostPath.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -65,7 +65,7 @@ std::vector<const Check*> ChosenChecks(const std::vector<std::string>& ids) {
 
 // A path as a shell takes it.
 std::string ShellWord(const std::filesystem::path& path) {
-    const std::string text = host::DisplayPath(path);
+    const std::string text = MachinePath(path);
     const bool isPlain = std::all_of(text.begin(), text.end(), [](unsigned char c) {
         return std::isalnum(c) != 0 ||
                std::string_view("/._-+,:@%").find(static_cast<char>(c)) != std::string_view::npos;

@@ -335,6 +335,17 @@ TEST_F(Validates, AndTheSeedDoesTheSameAgain) {
     EXPECT_EQ(RunCliphost(call).out, first.out);
 }
 
+TEST_F(Validates, AndTheLineToRunACheckAgainDoesThat) {
+    setenv("CLIPHOST_FAULT", "plugin-names", 1);
+    const std::filesystem::path module = folder() / "it's a \xFF module.nvx";
+    std::filesystem::copy_file(Faulty("FaultyModule"), module);
+    const json check = Validate(module, "--only plugin-names").Of("plugin-names");
+    const std::string again = check.value("again", "");
+    ASSERT_EQ(again.rfind("cliphost ", 0), 0u) << again;
+    ExpectSays(RunCliphost(again.substr(9)), 1, "failed     plugin-names\n");
+    EXPECT_EQ(check["found"], "the name is empty");
+}
+
 TEST_F(Validates, AndACrashCostsOneCheckAlone) {
     setenv("CLIPHOST_FAULT", "order-shutdown-twice", 1);
     const Answer answer = Validate(
