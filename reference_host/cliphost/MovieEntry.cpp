@@ -22,17 +22,7 @@ namespace {
 using catalog::Entry;
 using catalog::Row;
 
-const std::string kNothing;
 const std::vector<TreeNode> kNoNodes;
-
-const std::string& FactOf(const TreeNode& node, std::string_view name) {
-    for (const TreeNode::Fact& fact : node.facts) {
-        if (fact.name == name) {
-            return fact.value;
-        }
-    }
-    return kNothing;
-}
 
 const std::vector<TreeNode>& PartsOf(const TreeNode& node, std::string_view name) {
     for (const TreeNode::Branch& branch : node.branches) {

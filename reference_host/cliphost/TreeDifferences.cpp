@@ -219,12 +219,6 @@ const char* NameOf(Kind kind) {
     return kNames[static_cast<std::size_t>(kind)];
 }
 
-const std::string& FactOf(const TreeNode& node, const std::string& name) {
-    static const std::string nothing;
-    const TreeNode::Fact* const fact = FindFact(node, name);
-    return fact == nullptr ? nothing : fact->value;
-}
-
 std::string PropertyWords(const std::string& name) {
     const auto isUpper = [&](std::size_t i) {
         return i < name.size() && name[i] >= 'A' && name[i] <= 'Z';

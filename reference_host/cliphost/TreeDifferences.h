@@ -34,8 +34,6 @@ std::string InWords(const TreeDifference& difference);
 
 // "EditRate" -> "edit rate"
 std::string PropertyWords(const std::string& name);
-// The value of a property, empty where it has none.
-const std::string& FactOf(const TreeNode& node, const std::string& name);
 
 // Compares trees of objects, property by property. Objects in a list are those with the same key,
 // such as a slot's id or a name; the rest go by their content, and then by their order. What says
