@@ -21,9 +21,11 @@ namespace {
 constexpr int kDeepest = 32;  // objects inside objects
 constexpr std::string_view kClassOfObject = "ObjClass";
 
+}  // namespace
+
 // The names of definitions, each asked for once.
 template <class Definition>
-class Names {
+class NamesOfDefinitions {
 public:
     const std::string& Of(const host::Ref<Definition>& definition) {
         Named& named = names_[definition.get()];
@@ -43,8 +45,6 @@ private:
     std::unordered_map<Definition*, Named> names_{64};
 };
 
-}  // namespace
-
 class ObjectReader::TreeReader {
 public:
     explicit TreeReader(LongValues longValues) : values_(longValues) {}
@@ -62,8 +62,8 @@ private:
     void ReadProperty(const Property& property, int depth, TreeNode& node);
 
     ValueReader values_;
-    Names<IAAFClassDef> classes_;
-    Names<IAAFPropertyDef> properties_;
+    NamesOfDefinitions<IAAFClassDef> classes_;
+    NamesOfDefinitions<IAAFPropertyDef> properties_;
     // Of the object that is being read, behind those of the objects that it is part of.
     std::vector<Property> open_;
 };

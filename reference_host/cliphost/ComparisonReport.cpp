@@ -16,11 +16,11 @@ namespace {
 
 using nlohmann::ordered_json;
 
-ordered_json TextOrNull(const std::string& text) {
+ordered_json OrNull(const std::string& text) {
     return text.empty() ? ordered_json() : ordered_json(text);
 }
 
-ordered_json TextOrNull(const std::optional<std::string>& text) {
+ordered_json OrNull(const std::optional<std::string>& text) {
     return text ? ordered_json(*text) : ordered_json();
 }
 
@@ -69,14 +69,12 @@ void ComparisonLines::Finish(const ComparisonCounts& counts) {
 
 ordered_json ToJson(const ComparedObject& object, const TreeDifference& difference) {
     return {{"object",
-             {{"class", object.kind},
-              {"id", TextOrNull(object.id)},
-              {"name", TextOrNull(object.name)}}},
+             {{"class", object.kind}, {"id", OrNull(object.id)}, {"name", OrNull(object.name)}}},
             {"kind", NameOf(difference.kind)},
             {"place", difference.place},
-            {"property", TextOrNull(difference.property)},
-            {"before", TextOrNull(difference.before)},
-            {"after", TextOrNull(difference.after)},
+            {"property", OrNull(difference.property)},
+            {"before", OrNull(difference.before)},
+            {"after", OrNull(difference.after)},
             {"words", InWords(difference)}};
 }
 
