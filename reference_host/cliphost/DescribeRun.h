@@ -48,8 +48,8 @@ private:
     const DescribeOptions& options_;
     PathMaps maps_;  // to know which were used
     RowsOfMovies rows_;
-    std::optional<Bin> bin_;       // of what is made of all
-    host::Ref<IAAFFile> against_;  // empty: nothing is compared
+    std::optional<Bin> bin_;        // of what is made of all
+    host::Ref<IAAFFile> against_;   // empty: nothing is compared
     std::filesystem::path copyOf_;  // what the last movie that went into the bin is a copy of
     std::vector<std::pair<std::filesystem::path::string_type, ColumnValues>> columns_;
     std::vector<std::string> entries_;  // of the JSON list that comes at the end

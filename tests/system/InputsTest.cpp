@@ -795,6 +795,26 @@ TEST_F(Stopped, LeavesWholeFiles) {
     EXPECT_EQ(CountOutputs(".aaf"), kMovies - 1);
 }
 
+class StoppedReports : public Stopped {
+protected:
+    bool HasBegun() override { return Told().find("1001.mov") != std::string::npos; }
+};
+
+TEST_F(StoppedReports, HaveWhatWasReadUnlessThereWasOneBefore) {
+    const std::vector<std::string> call = {"report", "in", "-o", "r.html", "--jobs", "1"};
+    const Left left = Stop(SIGINT, call);
+    const std::string page = TextOf(folder() / "r.html");
+    EXPECT_NE(page.find("\"isWhole\":false"), std::string::npos);
+    const auto hasClip = [&](int number) {
+        return page.find("id=\"clip-" + std::to_string(number) + "\"") != std::string::npos;
+    };
+    EXPECT_TRUE(hasClip(left.done + left.failed - 1));
+    EXPECT_FALSE(hasClip(left.done + left.failed));
+    std::filesystem::remove(folder() / "told");
+    EXPECT_NE(Stop(SIGTERM, call).told.find("r.html: left as it was"), std::string::npos);
+    EXPECT_TRUE(TextOf(folder() / "r.html") == page);
+}
+
 TEST_F(Stopped, GoesOnWithSheets) {
     const Left left = Stop(SIGTERM, {"contact", "in", "--width", "16", "--frames", "1",
                                      "--skip-done", "--out-dir", "out"});

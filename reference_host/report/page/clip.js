@@ -86,7 +86,7 @@ function clipView(clip, order, goTo) {
     heading,
     el('p', {class: 'brief'}, brief(clip)),
     clip.warnings.length || clip.traits.length
-      ? section('part-warnings', 'Worth a look',
+      ? section('part-warnings', clip.failed ? 'Not described' : 'Worth a look',
           el('ul', {class: 'against'}, clip.warnings.map(warningBox)),
           el('ul', {class: 'traits'}, clip.traits.map((trait) => el('li', {},
             el('span', {class: 'mark'}, TRAIT_NAMES[trait.id] || trait.id), ' ', trait.words))))
