@@ -1,5 +1,7 @@
 # Settings that every target shares, and the few functions that make targets.
 
+include(CheckCXXCompilerFlag)
+
 set(CMAKE_CXX_STANDARD 17)
 set(CMAKE_CXX_STANDARD_REQUIRED ON)
 set(CMAKE_CXX_EXTENSIONS OFF)
@@ -33,8 +35,12 @@ set(CMAKE_UNITY_BUILD_BATCH_SIZE 8)
 
 add_library(project_options INTERFACE)
 target_include_directories(project_options INTERFACE ${PROJECT_SOURCE_DIR})
-target_compile_options(project_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wvla
-  -Wnon-virtual-dtor -Werror=format -Werror=return-type)
+if(MSVC)
+  target_compile_options(project_options INTERFACE /W4 /EHsc /permissive- /utf-8)
+else()
+  target_compile_options(project_options INTERFACE -Wall -Wextra -Wpedantic -Wshadow -Wvla
+    -Wnon-virtual-dtor -Werror=format -Werror=return-type)
+endif()
 if(CLIPHOST_SANITIZE)
   target_compile_options(project_options INTERFACE -fsanitize=${CLIPHOST_SANITIZE}
     -fno-sanitize-recover=all -fno-omit-frame-pointer)
@@ -43,6 +49,19 @@ endif()
 if(CLIPHOST_FUZZ)
   target_compile_options(project_options INTERFACE -fsanitize=fuzzer-no-link)
 endif()
+
+# need_flags(FLAG ...): ends the configuration where the compiler doesn't know one of them. For flags that
+# decide about results; one that is silently left out would change them.
+function(need_flags)
+  foreach(flag IN LISTS ARGN)
+    string(MAKE_C_IDENTIFIER "KNOWS${flag}" known)
+    check_cxx_compiler_flag(${flag} ${known})
+    if(NOT ${known})
+      message(FATAL_ERROR "${CMAKE_CXX_COMPILER} doesn't know ${flag}, which this project needs. "
+                          "A newer compiler and assembler may.")
+    endif()
+  endforeach()
+endfunction()
 
 # define_paths(SOURCE NAME=PATH ...): texts for one source file alone. All other
 # files compile alike wherever the project lies, so a cache of compilations

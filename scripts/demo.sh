@@ -137,6 +137,11 @@ for path in "$@"; do
 done
 
 echo
+echo '== report'
+"$cliphost" report "$@" "${others[@]}" --use-alpha --title 'Demo movies' -o "$out/report.html" || status=$?
+
+echo
 echo "AAF files are in $out/aaf; any program that reads AAF opens them."
 echo "Contact sheets, pictures and alpha are in $pictures, the sounds in $sounds."
+echo "All of them in a browser: $(realpath "$out/report.html")"
 exit $status

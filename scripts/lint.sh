@@ -20,6 +20,10 @@ rule 'system headers belong in source/plugin/os/' \
   '#include <(windows|unistd|fcntl|dlfcn|pthread|sys/[a-z]+)\.h>' -- source public_include ':!source/plugin/os'
 rule 'system headers belong in reference_host/system/' \
   '#include <(windows|bcrypt|unistd|fcntl|dlfcn|dirent|pthread|sys/[a-z]+)\.h>' -- reference_host ':!reference_host/system'
+rule 'attributes of compilers belong in host_interfaces/framework/Compiler.h' '__attribute__|__declspec' \
+  -- source host_interfaces public_include text aaf_library reference_host \
+     ':!host_interfaces/framework/Compiler.h' ':!reference_host/quicktime/pixels'
+rule 'tr1 belongs in source/plugin/Tr1Memory.h' '#include <tr1/' -- source tests ':!source/plugin/Tr1Memory.h'
 rule 'throw typed codes, never literals or raw results' 'throw (0x|-?[0-9]|hr\b|\(?HRESULT)' -- source
 rule 'a long text has no fixed width here' '\b(unsigned )?long [a-z_A-Z]+ *(=|;|,|\))' -- source
 
@@ -52,5 +56,8 @@ if ! git ls-files 'source/*.cpp' | grep -v _windows \
   failed=1
 fi
 rm -f "$log"
+# For hosts that Microsoft's compiler makes.
+scripts/check_border_places.sh || failed=1
+scripts/check_clang_cl.sh || failed=1
 ((failed == 0)) && echo 'lint: nothing to say'
 exit $failed

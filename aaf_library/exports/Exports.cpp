@@ -16,12 +16,9 @@
 #include "host_interfaces/aaf/AAFExports.h"
 #include "host_interfaces/aaf/AAFFile.h"
 #include "host_interfaces/aaf/AAFResultCodes.h"
+#include "host_interfaces/framework/Compiler.h"
 
-#ifdef _WIN32
-#define AAF_EXPORT extern "C" __declspec(dllexport)
-#else
-#define AAF_EXPORT extern "C" __attribute__((visibility("default")))
-#endif
+#define AAF_EXPORT extern "C" NCF_EXPORT
 
 namespace {
 

@@ -232,7 +232,7 @@ constexpr ResultText kResults[] = {
     {0x80120166u, "AAFRESULT_ALREADY_INITIALIZED", "The object was initialized before."},
     {0x80120167u, "AAFRESULT_NOT_INITIALIZED", "The object has to be initialized first."},
     {0x80120168u, "AAFRESULT_INTERNAL_ERROR", "Something went wrong inside the library."},
-    {0x80120169u, "AAFRESULT_DATA_SIZE", ""},
+    {0x80120169u, "AAFRESULT_DATA_SIZE", "The content takes more bytes than a file of that kind may have."},
     {0x8012016Au, "AAFRESULT_ILLEGAL_VALUE", "The value or its size does not fit the type."},
     {0x8012016Bu, "AAFRESULT_INVALID_TRANSPARENCY", "The transparency is none of the known ones."},
     {0x8012016Cu, "AAFRESULT_INVALID_PARAM", "An argument is not valid."},

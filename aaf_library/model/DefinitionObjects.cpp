@@ -2,8 +2,6 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/DefinitionObjects.h"
 
-#include <algorithm>
-
 #include "aaf_library/model/WeakLists.h"
 
 namespace aaf {
@@ -36,9 +34,7 @@ HRESULT DefinitionObject::Initialize(aafUID_constref id, aafCharacter_constptr n
 }
 
 HRESULT ContainerDefinition::SetEssenceIsIdentified(aafBoolean_t essenceIsIdentified) {
-    return IsBoolean(essenceIsIdentified)
-               ? PutInteger(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified)
-               : AAFRESULT_INVALID_ENUM_VALUE;
+    return PutBoolean(prop::ContainerDefinition_EssenceIsIdentified, essenceIsIdentified);
 }
 
 HRESULT CodecDefinition::IsEssenceKindSupported(IAAFDataDef* essenceKind,
@@ -46,9 +42,8 @@ HRESULT CodecDefinition::IsEssenceKindSupported(IAAFDataDef* essenceKind,
     if (essenceKind == nullptr || isSupported == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const std::vector<Unknown*> kinds = WeakTargets(prop::CodecDefinition_DataDefinitions);
-    const bool found =
-        std::find(kinds.begin(), kinds.end(), ImplementationOf(essenceKind)) != kinds.end();
+    const PropertyKey& kinds = prop::CodecDefinition_DataDefinitions;
+    const bool found = FindWeak(*this, kinds, essenceKind) < CountWeak(*this, kinds);
     *isSupported = found ? kAAFTrue : kAAFFalse;
     return AAFRESULT_SUCCESS;
 }

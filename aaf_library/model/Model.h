@@ -141,7 +141,7 @@ private:
     PropertyId nextPropertyId_ = 0xFFFF;
     RefPtr<Dictionary> dictionary_;
     std::vector<Copier*> waiting_;
-    std::vector<GUID> copying_;  // definitions on their way into this model
+    std::vector<const Object*> copying_;  // definitions of others on their way into this model
 };
 
 }  // namespace aaf

@@ -73,10 +73,10 @@ template <class Set>
 void Model::CopyDefinition(const Object* definition, const Set& set, const GUID& id) {
     // Definitions may refer to one another in a circle.
     if (definition == nullptr || dictionary_->FindDefinition(set, id) != nullptr ||
-        std::find(copying_.begin(), copying_.end(), id) != copying_.end()) {
+        std::find(copying_.begin(), copying_.end(), definition) != copying_.end()) {
         return;
     }
-    copying_.push_back(id);
+    copying_.push_back(definition);
     dictionary_->AddDefinition(set, CopyObject(*definition).get());
     copying_.pop_back();
 }
@@ -108,9 +108,14 @@ void Model::CopyReferredTo(const PropertyValue& value) {
     }
     for (std::size_t at = 0; at + kGuidSize <= value.bytes().size(); at += kGuidSize) {
         const GUID id = GuidAt(value.bytes().data() + at);
-        CopyDefinition(
-            dynamic_cast<DefinitionObject*>(type.model()->FindTarget(weak->targetClass(), id)),
-            weak->targetClass(), id);
+        const Unknown* const target = type.model()->FindTarget(weak->targetClass(), id);
+        if (const auto* const known = dynamic_cast<const DefinitionObject*>(target)) {
+            CopyDefinition(known, weak->targetClass(), id);
+        } else if (const auto* const cls = dynamic_cast<const ClassDefinition*>(target)) {
+            ClassLike(*cls);
+        } else if (const auto* const named = dynamic_cast<const TypeDefinition*>(target)) {
+            TypeLike(*named);
+        }
     }
 }
 

@@ -99,6 +99,9 @@ public:
 
     // -- Plain values.
     HRESULT PutInteger(const PropertyKey& key, aafInt64 value);
+    HRESULT PutBoolean(const PropertyKey& key, aafBoolean_t value) {
+        return IsBoolean(value) ? PutInteger(key, value) : AAFRESULT_INVALID_ENUM_VALUE;
+    }
     template <class Integer>
     HRESULT ReadInteger(const PropertyKey& key, Integer* out) const;
     // The value, or `absent` when it is not there.
@@ -122,6 +125,8 @@ public:
     // Values that carry their type: tagged values and parameters.
     HRESULT PutIndirect(const PropertyKey& key, IAAFTypeDef* type, const void* data,
                         std::size_t bytes);
+    // Another value of the type that is there.
+    HRESULT ReplaceIndirect(const PropertyKey& key, const void* data, std::size_t bytes);
     HRESULT ReadIndirect(const PropertyKey& key, void* data, std::size_t bytes) const;
     HRESULT ReadIndirectSize(const PropertyKey& key, aafUInt32* bytes) const;
     HRESULT ReadIndirectType(const PropertyKey& key, IAAFTypeDef** type) const;
@@ -170,7 +175,7 @@ public:
     // Not in a dictionary: AAFRESULT_OBJECT_NOT_ATTACHED; id not in this model:
     // AAFRESULT_INVALID_OBJ.
     HRESULT PutWeak(const PropertyKey& key, IUnknown* target);
-    Unknown* WeakTarget(const PropertyKey& key) const;
+    Unknown* WeakTarget(const PropertyKey& key) const { return WeakTargetAt(key, 0); }
     template <class I>
     HRESULT ReadWeak(const PropertyKey& key, I** out) const {
         if (out == nullptr) {
@@ -183,7 +188,8 @@ public:
         return target == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : GiveOut(target, out);
     }
     HRESULT AppendWeak(const PropertyKey& key, IUnknown* target);
-    std::vector<Unknown*> WeakTargets(const PropertyKey& key) const;
+    // That of a reference in a list; null behind the last, and where the model doesn't have it.
+    Unknown* WeakTargetAt(const PropertyKey& key, std::size_t index) const;
 
     // -- IAAFObject
     HRESULT GetGeneration(IAAFIdentification** generation) override;

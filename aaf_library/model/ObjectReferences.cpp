@@ -169,8 +169,8 @@ Object* Object::FindInSet(const PropertyKey& key, const void* keyBytes, std::siz
     const auto& elements = value->objects();
     const auto place =
         std::partition_point(elements.begin(), elements.end(), [&](const RefPtr<Object>& at) {
-            const Bytes& key = KeyOf(*at);
-            return std::lexicographical_compare(key.begin(), key.end(), first, last);
+            const Bytes& id = KeyOf(*at);
+            return std::lexicographical_compare(id.begin(), id.end(), first, last);
         });
     if (place == elements.end()) {
         return nullptr;
@@ -229,22 +229,16 @@ HRESULT Object::WeakKey(const PropertyKey& key, IUnknown* argument, Bytes* bytes
     return AAFRESULT_SUCCESS;
 }
 
-Unknown* Object::WeakTarget(const PropertyKey& key) const {
-    const std::vector<Unknown*> targets = WeakTargets(key);
-    return targets.empty() ? nullptr : targets.front();
-}
-
-std::vector<Unknown*> Object::WeakTargets(const PropertyKey& key) const {
-    std::vector<Unknown*> targets;
-    const PropertyValue* value = FindValue(key);
-    const GUID* targetClass = value == nullptr ? nullptr : TargetClassOf(value->type());
-    if (targetClass == nullptr) {
-        return targets;
+Unknown* Object::WeakTargetAt(const PropertyKey& key, std::size_t index) const {
+    const PropertyValue* const value = FindValue(key);
+    if (value == nullptr || index >= value->bytes().size() / kGuidSize) {
+        return nullptr;
     }
-    for (std::size_t at = 0; at + kGuidSize <= value->bytes().size(); at += kGuidSize) {
-        targets.push_back(model()->FindTarget(*targetClass, GuidAt(value->bytes().data() + at)));
-    }
-    return targets;
+    const GUID* const targetClass = TargetClassOf(value->type());
+    return targetClass == nullptr
+               ? nullptr
+               : model()->FindTarget(*targetClass,
+                                     GuidAt(value->bytes().data() + index * kGuidSize));
 }
 
 }  // namespace aaf

@@ -164,6 +164,23 @@ TypeDefinition* Object::IndirectType(const PropertyValue* value) const {
                                                                      : nullptr;
 }
 
+HRESULT Object::ReplaceIndirect(const PropertyKey& key, const void* data, std::size_t bytes) {
+    if (data == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    PropertyValue* const value = FindValue(key);
+    const TypeDefinition* const actual = IndirectType(value);
+    if (actual == nullptr) {
+        return value == nullptr ? AAFRESULT_PROP_NOT_PRESENT : AAFRESULT_TYPE_NOT_FOUND;
+    }
+    Bytes stored;
+    const HRESULT result = TypeIndirect::Wrap(*actual, data, bytes, stored);
+    if (result >= 0) {
+        value->BytesToChange() = std::move(stored);
+    }
+    return result;
+}
+
 HRESULT Object::ReadIndirect(const PropertyKey& key, void* data, std::size_t bytes) const {
     if (data == nullptr) {
         return AAFRESULT_NULL_PARAM;

@@ -13,13 +13,9 @@ HRESULT OperationDefinition::LookupParameterDef(aafUID_constref parameterDefId,
     if (parameterDef == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    for (Unknown* target : WeakTargets(prop::OperationDefinition_ParametersDefined)) {
-        auto* const definition = dynamic_cast<ParameterDefinition*>(target);
-        if (definition != nullptr && definition->Identification() == parameterDefId) {
-            return GiveOut(definition, parameterDef);
-        }
-    }
-    return AAFRESULT_NO_MORE_OBJECTS;
+    const PropertyKey& all = prop::OperationDefinition_ParametersDefined;
+    Unknown* const found = WeakTargetAt(all, FindWeak(*this, all, parameterDefId));
+    return found == nullptr ? AAFRESULT_NO_MORE_OBJECTS : GiveOut(found, parameterDef);
 }
 
 }  // namespace aaf

@@ -19,8 +19,7 @@ public:
         return ReadInteger(prop::OperationDefinition_IsTimeWarp, isTimeWarp);
     }
     HRESULT SetIsTimeWarp(aafBoolean_t isTimeWarp) override {
-        return IsBoolean(isTimeWarp) ? PutInteger(prop::OperationDefinition_IsTimeWarp, isTimeWarp)
-                                     : AAFRESULT_INVALID_ENUM_VALUE;
+        return PutBoolean(prop::OperationDefinition_IsTimeWarp, isTimeWarp);
     }
     HRESULT GetCategory(aafUID_t* value) override {
         return ReadStruct(prop::OperationDefinition_OperationCategory, value);

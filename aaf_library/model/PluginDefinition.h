@@ -170,9 +170,6 @@ private:
         const HRESULT result = ReadStruct(minimum, minVersion);
         return result < 0 ? result : ReadStruct(maximum, maxVersion);
     }
-    HRESULT PutBoolean(const PropertyKey& key, aafBoolean_t value) {
-        return IsBoolean(value) ? PutInteger(key, value) : AAFRESULT_INVALID_ENUM_VALUE;
-    }
 };
 
 }  // namespace aaf

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 #include <memory>
 #include <utility>
@@ -71,8 +72,8 @@ public:
     const std::shared_ptr<const AsStored>& asStored() const { return asStored_; }
     void KeepAsStored(std::shared_ptr<const AsStored> asStored) { asStored_ = std::move(asStored); }
 
-    // Read and write position of a stream value.
-    std::uint64_t position() const { return position_; }
+    // Read and write position of a stream value. One that has become shorter has it at its end.
+    std::uint64_t position() const { return std::min<std::uint64_t>(position_, bytes_.size()); }
     void SetPosition(std::uint64_t position) { position_ = position; }
     // Byte order mark of a stream: 0x55 unspecified, 0x4C little, 0x42 big.
     std::uint8_t streamByteOrder() const { return streamByteOrder_; }

@@ -202,7 +202,7 @@ HRESULT TypeOfElements::FillFromValues(PropertyValue& value, IAAFPropertyValue**
 
 HRESULT TypeOfElements::TakeBoth(IAAFPropertyValue* list, IAAFPropertyValue* member,
                                  PropertyValue** value, PropertyValue** element) const {
-    if (list == nullptr || member == nullptr) {
+    if (member == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
     const HRESULT result = Take(list, value);

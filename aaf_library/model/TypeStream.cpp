@@ -38,7 +38,6 @@ HRESULT TypeStream::SetSize(IAAFPropertyValue* streamPropertyValue, aafInt64 new
         return AAFRESULT_BAD_SIZE;
     }
     value->BytesToChange().resize(static_cast<std::size_t>(newSize));
-    value->SetPosition(std::min<std::uint64_t>(value->position(), value->bytes().size()));
     return AAFRESULT_SUCCESS;
 }
 
@@ -212,39 +211,40 @@ HRESULT TypeStream::ReadElements(IAAFPropertyValue* streamPropertyValue, IAAFTyp
     return count == 0 && dataSize > 0 ? AAFRESULT_END_OF_DATA : AAFRESULT_SUCCESS;
 }
 
-HRESULT TypeStream::WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
-                                  aafUInt32 dataSize, aafMemPtr_t data) {
+HRESULT TypeStream::StoreElements(IAAFPropertyValue* argument, IAAFTypeDef* elementType,
+                                  aafUInt32 dataSize, const aafUInt8* data, Bytes* stored) const {
     PropertyValue* value = nullptr;
     const TypeDefinition* element = nullptr;
     if (data == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const HRESULT result =
-        TakeElements(streamPropertyValue, elementType, dataSize, &value, &element);
-    if (result < 0 || dataSize == 0) {
+    const HRESULT result = TakeElements(argument, elementType, dataSize, &value, &element);
+    if (result < 0) {
         return result;
     }
-    Bytes stored;
+    stored->reserve(1);  // no elements have an address too
     for (std::size_t at = 0; at < dataSize; at += element->NativeSize()) {
-        element->AppendStored(data + at, stored);
+        element->AppendStored(data + at, *stored);
     }
-    return Write(streamPropertyValue, static_cast<aafUInt32>(stored.size()), stored.data());
+    return AAFRESULT_SUCCESS;
+}
+
+HRESULT TypeStream::WriteElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
+                                  aafUInt32 dataSize, aafMemPtr_t data) {
+    Bytes stored;
+    const HRESULT result = StoreElements(streamPropertyValue, elementType, dataSize, data, &stored);
+    return result < 0
+               ? result
+               : Write(streamPropertyValue, static_cast<aafUInt32>(stored.size()), stored.data());
 }
 
 HRESULT TypeStream::AppendElements(IAAFPropertyValue* streamPropertyValue, IAAFTypeDef* elementType,
                                    aafUInt32 dataSize, aafMemPtr_t data) {
-    PropertyValue* value = nullptr;
-    const TypeDefinition* element = nullptr;
-    if (data == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    const HRESULT result =
-        TakeElements(streamPropertyValue, elementType, dataSize, &value, &element);
-    if (result < 0) {
-        return result;
-    }
-    value->SetPosition(value->bytes().size());
-    return WriteElements(streamPropertyValue, elementType, dataSize, data);
+    Bytes stored;
+    const HRESULT result = StoreElements(streamPropertyValue, elementType, dataSize, data, &stored);
+    return result < 0
+               ? result
+               : Append(streamPropertyValue, static_cast<aafUInt32>(stored.size()), stored.data());
 }
 
 }  // namespace aaf

@@ -49,6 +49,9 @@ private:
     // The element's type, when that many bytes of a caller are whole elements of it.
     HRESULT TakeElements(IAAFPropertyValue* argument, IAAFTypeDef* elementType, aafUInt32 dataSize,
                          PropertyValue** value, const TypeDefinition** element) const;
+    // The same bytes as a stream has them.
+    HRESULT StoreElements(IAAFPropertyValue* argument, IAAFTypeDef* elementType, aafUInt32 dataSize,
+                          const aafUInt8* data, Bytes* stored) const;
 };
 
 }  // namespace aaf

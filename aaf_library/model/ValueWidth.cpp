@@ -20,6 +20,46 @@ const TypeInteger* IntegerIn(const TypeDefinition& type) {
     return number.kind() == TypeKind::Integer ? static_cast<const TypeInteger*>(&number) : nullptr;
 }
 
+bool WidenNumber(const TypeInteger& from, const TypeInteger& to, const std::uint8_t* stored,
+                 Bytes& bytes) {
+    const std::size_t size = from.StoredSize();
+    const std::uint64_t number = from.IsSignedType()
+                                     ? static_cast<std::uint64_t>(SignedAt(stored, size))
+                                     : UnsignedAt(stored, size);
+    AppendNumber(number, to.StoredSize(), bytes);
+    // It has to come back as the same.
+    const std::uint8_t* const widened = bytes.data() + bytes.size() - to.StoredSize();
+    return number == (to.IsSignedType()
+                          ? static_cast<std::uint64_t>(SignedAt(widened, to.StoredSize()))
+                          : UnsignedAt(widened, to.StoredSize()));
+}
+
+// The type of the elements of an array; null for anything else.
+const TypeDefinition* ElementIn(const TypeDefinition& type) {
+    const TypeDefinition& plain = type.Resolved();
+    const bool isArray = plain.kind() == TypeKind::VariableArray ||
+                         plain.kind() == TypeKind::FixedArray || plain.kind() == TypeKind::Set;
+    return isArray ? plain.element() : nullptr;
+}
+
+// A number, or all the elements of an array.
+bool WidenEach(const TypeDefinition& from, const TypeDefinition& to, const std::uint8_t* stored,
+               std::size_t size, Bytes& bytes) {
+    const TypeDefinition* const element = ElementIn(from);
+    const TypeDefinition* const wider = ElementIn(to);
+    const TypeInteger* const number = IntegerIn(element == nullptr ? from : *element);
+    const TypeInteger* const target = IntegerIn(wider == nullptr ? to : *wider);
+    if ((element == nullptr) != (wider == nullptr) || number == nullptr || target == nullptr) {
+        return false;
+    }
+    const std::size_t step = number->StoredSize();
+    bool fits = step != 0 && (element == nullptr ? size == step : size % step == 0);
+    for (std::size_t at = 0; fits && at < size; at += step) {
+        fits = WidenNumber(*number, *target, stored + at, bytes);
+    }
+    return fits;
+}
+
 }  // namespace
 
 bool HasWidthOf(const TypeDefinition& type, const TypeDefinition& other) {
@@ -31,22 +71,8 @@ bool HasWidthOf(const TypeDefinition& type, const TypeDefinition& other) {
 }
 
 bool Widen(const PropertyValue& value, const TypeDefinition& to, Bytes& bytes) {
-    const TypeInteger* const from = IntegerIn(value.type());
-    const TypeInteger* const target = IntegerIn(to);
-    const Bytes& stored = value.bytes();
-    if (from == nullptr || target == nullptr || stored.size() != from->StoredSize()) {
-        return false;
-    }
-    const std::uint64_t number =
-        from->IsSignedType() ? static_cast<std::uint64_t>(SignedAt(stored.data(), stored.size()))
-                             : UnsignedAt(stored.data(), stored.size());
     bytes.clear();
-    AppendNumber(number, target->StoredSize(), bytes);
-    // It has to come back as the same.
-    const std::uint64_t back =
-        target->IsSignedType() ? static_cast<std::uint64_t>(SignedAt(bytes.data(), bytes.size()))
-                               : UnsignedAt(bytes.data(), bytes.size());
-    return back == number;
+    return WidenEach(value.type(), to, value.bytes().data(), value.bytes().size(), bytes);
 }
 
 bool HasRedefinedTypes(const Model& model) {

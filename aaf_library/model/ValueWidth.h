@@ -12,8 +12,8 @@ namespace aaf {
 // Whether values of both types are stored in the same bytes, as far as their widths tell.
 bool HasWidthOf(const TypeDefinition& type, const TypeDefinition& other);
 
-// A value's bytes as another type has them, which HasWidthOf denied. False for what is no number
-// and for a number that doesn't fit.
+// A value's bytes as another type has them, which HasWidthOf denied. False for what is neither a
+// number nor an array of numbers, and for a number that doesn't fit.
 bool Widen(const PropertyValue& value, const TypeDefinition& to, Bytes& bytes);
 
 // Whether a model has renames or enumerations of other integers than every file begins with.

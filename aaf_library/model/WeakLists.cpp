@@ -33,6 +33,23 @@ HRESULT ReadWeakCount(const Object& object, const PropertyKey& key, aafUInt32* c
     return AAFRESULT_SUCCESS;
 }
 
+aafUInt32 FindWeak(const Object& object, const PropertyKey& key, const GUID& id) {
+    const PropertyValue* const ids = object.FindValue(key);
+    const aafUInt32 count = CountWeak(object, key);
+    aafUInt32 place = 0;
+    while (place < count && GuidAt(ids->bytes().data() + place * kGuidSize) != id) {
+        ++place;
+    }
+    return place;
+}
+
+aafUInt32 FindWeak(const Object& object, const PropertyKey& key, IUnknown* target) {
+    GUID id{};
+    Unknown* const known = ImplementationOf(target);
+    return known != nullptr && WeakKeyOf(*known, &id) ? FindWeak(object, key, id)
+                                                      : CountWeak(object, key);
+}
+
 HRESULT InsertWeakAt(Object& object, const PropertyKey& key, aafUInt32 index, IUnknown* target) {
     if (target == nullptr) {
         return AAFRESULT_NULL_PARAM;
@@ -61,30 +78,25 @@ HRESULT RemoveWeak(Object& object, const PropertyKey& key, IUnknown* target) {
     if (target == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const std::vector<Unknown*> targets = object.WeakTargets(key);
-    const auto found = std::find(targets.begin(), targets.end(), ImplementationOf(target));
-    return found == targets.end()
-               ? AAFRESULT_OBJECT_NOT_FOUND
-               : RemoveWeakAt(object, key, static_cast<aafUInt32>(found - targets.begin()));
+    const HRESULT result = RemoveWeakAt(object, key, FindWeak(object, key, target));
+    return result == AAFRESULT_BADINDEX ? AAFRESULT_OBJECT_NOT_FOUND : result;
 }
 
 HRESULT AddWeakToSet(Object& object, const PropertyKey& key, IUnknown* target) {
-    const HRESULT result = object.AppendWeak(key, target);
-    if (result < 0) {
+    const aafUInt32 count = CountWeak(object, key);
+    if (const HRESULT result = object.AppendWeak(key, target); result < 0) {
         return result;
     }
     Bytes& ids = object.RequireValue(key)->BytesToChange();
-    const std::size_t count = ids.size() / kGuidSize - 1;
     const std::uint8_t* const added = ids.data() + count * kGuidSize;
-    std::size_t place = 0;
-    int order = -1;
-    while (place < count &&
-           (order = std::memcmp(ids.data() + place * kGuidSize, added, kGuidSize)) < 0) {
-        ++place;
-    }
-    if (order == 0) {
+    // A file, or a caller by way of values, may have them in any order.
+    if (FindWeak(object, key, GuidAt(added)) < count) {
         ids.resize(count * kGuidSize);
         return AAFRESULT_OBJECT_ALREADY_ATTACHED;
+    }
+    std::size_t place = 0;
+    while (place < count && std::memcmp(ids.data() + place * kGuidSize, added, kGuidSize) < 0) {
+        ++place;
     }
     MoveLastTo(ids, place);
     return AAFRESULT_SUCCESS;

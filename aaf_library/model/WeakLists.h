@@ -12,6 +12,11 @@ namespace aaf {
 aafUInt32 CountWeak(const Object& object, const PropertyKey& key);
 HRESULT ReadWeakCount(const Object& object, const PropertyKey& key, aafUInt32* count);
 
+// The place of the reference with that id; the number of references when there is none.
+aafUInt32 FindWeak(const Object& object, const PropertyKey& key, const GUID& id);
+// The same by a definition, which may be that of another file.
+aafUInt32 FindWeak(const Object& object, const PropertyKey& key, IUnknown* target);
+
 // Behind the last: AAFRESULT_BADINDEX.
 HRESULT InsertWeakAt(Object& object, const PropertyKey& key, aafUInt32 index, IUnknown* target);
 HRESULT RemoveWeakAt(Object& object, const PropertyKey& key, aafUInt32 index);
@@ -26,8 +31,7 @@ template <class Element, class Enum>
 HRESULT EnumerateWeak(Object* object, const PropertyKey& key, Enum** enumerator) {
     return MakeEnumerator<Element>(
         [holder = RefPtr<Object>(object), key](std::size_t index) {
-            const std::vector<Unknown*> targets = holder->WeakTargets(key);
-            return RefPtr<Unknown>(index < targets.size() ? targets[index] : nullptr);
+            return RefPtr<Unknown>(holder->WeakTargetAt(key, index));
         },
         enumerator);
 }

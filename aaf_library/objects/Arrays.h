@@ -38,10 +38,11 @@ HRESULT ReadElements(const Object& object, const PropertyKey& key, std::vector<E
     return count == 0 ? result : object.ReadNative(key, elements.data(), count * sizeof(Element));
 }
 
-// The elements in order, as two equal sets should be stored alike.
+// The elements in order and each once, as two equal sets should be stored alike.
 template <class Element, class Less>
 HRESULT PutSet(Object& object, const PropertyKey& key, std::vector<Element> elements, Less less) {
     std::sort(elements.begin(), elements.end(), less);
+    elements.erase(std::unique(elements.begin(), elements.end()), elements.end());
     elements.reserve(1);  // an empty set has an address too
     return object.PutNative(key, elements.data(), elements.size() * sizeof(Element));
 }

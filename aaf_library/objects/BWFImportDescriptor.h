@@ -14,10 +14,11 @@ namespace aaf {
 // A piece of a broadcast wave file that its importer did not understand.
 class RIFFChunk : public Implements<Object, IAAFRIFFChunk> {
 public:
-    // Makes an empty chunk.
+    // Makes an empty chunk, also of one that held something.
     HRESULT Initialize(aafUInt32 chunkID) override {
-        PutInteger(prop::RIFFChunk_ChunkLength, 0);
+        RemoveValue(prop::RIFFChunk_ChunkData);
         RequireValue(prop::RIFFChunk_ChunkData);
+        PutInteger(prop::RIFFChunk_ChunkLength, 0);
         return SetChunkID(chunkID);
     }
     HRESULT SetChunkID(aafUInt32 chunkID) override {

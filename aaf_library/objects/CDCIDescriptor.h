@@ -66,10 +66,7 @@ public:
         return ReadInteger(prop::CDCIDescriptor_AlphaSamplingWidth, width);
     }
     HRESULT SetReversedByteOrder(aafBoolean_t reversed) override {
-        if (!(IsBoolean(reversed))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::CDCIDescriptor_ReversedByteOrder, reversed);
+        return PutBoolean(prop::CDCIDescriptor_ReversedByteOrder, reversed);
     }
     HRESULT GetReversedByteOrder(aafBoolean_t* reversed) override {
         return ReadInteger(prop::CDCIDescriptor_ReversedByteOrder, reversed);

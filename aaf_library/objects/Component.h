@@ -66,6 +66,7 @@ public:
     HRESULT SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) override;
     HRESULT SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
                               aafFrameOffset_t* offset) override;
+    virtual bool HasTimecode() const { return false; }
 };
 
 // Nothing, for a while.

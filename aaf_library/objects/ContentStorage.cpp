@@ -24,6 +24,10 @@ Mob* ContentStorage::FindMob(const aafMobID_t& id) const {
     return dynamic_cast<Mob*>(FindInSet(prop::ContentStorage_Mobs, &id, sizeof id));
 }
 
+Object* ContentStorage::FindEssence(const aafMobID_t& fileMob) const {
+    return FindInSet(prop::ContentStorage_EssenceData, &fileMob, sizeof fileMob);
+}
+
 Mob* ContentStorage::MobAt(aafUInt32 index) const {
     return dynamic_cast<Mob*>(ObjectAt(prop::ContentStorage_Mobs, index));
 }
@@ -121,26 +125,29 @@ HRESULT ContentStorage::RemoveMob(IAAFMob* mob) {
 
 HRESULT ContentStorage::AddCopy(const Mob& source, bool withEssence, RefPtr<Mob>& copy) {
     const aafMobID_t id = source.id();
-    if (FindMob(id) != nullptr) {
+    const auto* const from = dynamic_cast<const ContentStorage*>(source.owner());
+    const Object* const essence = withEssence && from != nullptr ? from->FindEssence(id) : nullptr;
+    if (FindMob(id) != nullptr || (essence != nullptr && FindEssence(id) != nullptr)) {
         return AAFRESULT_DUPLICATE_MOBID;
     }
     const RefPtr<Object> copied = model()->CopyObject(source);
+    const RefPtr<Object> copiedEssence =
+        essence == nullptr ? nullptr : model()->CopyObject(*essence);
     copy = RefPtr<Mob>(dynamic_cast<Mob*>(copied.get()));
-    if (!copy) {
+    if (!copy || (essence != nullptr && !copiedEssence)) {
         return AAFRESULT_INTERNAL_ERROR;
     }
     const HRESULT result = AddToSet(prop::ContentStorage_Mobs, copy->Identity());
-    const ContentStorage* const from = dynamic_cast<const ContentStorage*>(source.owner());
-    if (result < 0 || !withEssence || from == nullptr) {
-        return result;
+    return result < 0 || !copiedEssence
+               ? result
+               : AddToSet(prop::ContentStorage_EssenceData, copiedEssence->Identity());
+}
+
+void ContentStorage::RemoveCopy(Mob& copy) {
+    if (Object* const essence = FindEssence(copy.id())) {
+        RemoveObject(prop::ContentStorage_EssenceData, essence->Identity());
     }
-    const Object* const essence = from->FindInSet(prop::ContentStorage_EssenceData, &id, sizeof id);
-    if (essence == nullptr) {
-        return result;
-    }
-    const RefPtr<Object> copiedEssence = model()->CopyObject(*essence);
-    return !copiedEssence ? AAFRESULT_INTERNAL_ERROR
-                          : AddToSet(prop::ContentStorage_EssenceData, copiedEssence->Identity());
+    RemoveObject(prop::ContentStorage_Mobs, copy.Identity());
 }
 
 HRESULT ContentStorage::CountEssenceData(aafUInt32* result) {
@@ -155,9 +162,8 @@ HRESULT ContentStorage::IsEssenceDataPresent(aafMobID_constref fileMobID, aafFil
     if (result == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const bool present =
-        FindInSet(prop::ContentStorage_EssenceData, &fileMobID, sizeof fileMobID) != nullptr;
-    *result = present && fmt == kAAFEssence ? kAAFTrue : kAAFFalse;
+    const bool present = fmt == kAAFEssence && FindEssence(fileMobID) != nullptr;
+    *result = present ? kAAFTrue : kAAFFalse;
     return AAFRESULT_SUCCESS;
 }
 
@@ -173,8 +179,7 @@ HRESULT ContentStorage::AddEssenceData(IAAFEssenceData* essenceData) {
     if (added == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }
-    const aafMobID_t id = added->mobId();
-    if (FindInSet(prop::ContentStorage_EssenceData, &id, sizeof id) != nullptr) {
+    if (FindEssence(added->mobId()) != nullptr) {
         return AAFRESULT_DUPLICATE_MOBID;
     }
     return AddToSet(prop::ContentStorage_EssenceData, essenceData);
@@ -195,7 +200,7 @@ HRESULT ContentStorage::LookupEssenceData(aafMobID_constref mobID, IAAFEssenceDa
     if (essenceData == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    Object* const found = FindInSet(prop::ContentStorage_EssenceData, &mobID, sizeof mobID);
+    Object* const found = FindEssence(mobID);
     return found == nullptr ? AAFRESULT_ESSENCE_NOT_FOUND : GiveOut(found, essenceData);
 }
 

@@ -19,10 +19,14 @@ public:
     Mob* FindMob(const aafMobID_t& id) const;
     aafUInt32 MobCount() const { return CountObjects(prop::ContentStorage_Mobs); }
     Mob* MobAt(aafUInt32 index) const;
+    // The essence data of a file mob.
+    Object* FindEssence(const aafMobID_t& fileMob) const;
     // Whether there is nothing else in it: no essence and no properties of other kinds.
     bool HoldsMobsAlone() const;
     // Adds a copy of a mob of any file, with its essence if that is wanted.
     HRESULT AddCopy(const Mob& source, bool withEssence, RefPtr<Mob>& copy);
+    // Takes such a copy out again.
+    void RemoveCopy(Mob& copy);
 
     HRESULT LookupMob(aafMobID_constref mobID, IAAFMob** mob) override;
     HRESULT CountMobs(aafMobKind_t mobKind, aafNumSlots_t* result) override;

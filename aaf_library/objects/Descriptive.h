@@ -23,8 +23,10 @@ class DescriptiveMarker : public Implements<CommentMarker, IAAFDescriptiveMarker
 public:
     HRESULT Initialize() override { return AAFRESULT_SUCCESS; }
     HRESULT SetDescribedSlotIDs(aafUInt32 numberElements, aafUInt32* ids) override {
-        return PutNative(prop::DescriptiveMarker_DescribedSlots, ids,
-                         std::size_t{numberElements} * sizeof *ids);
+        return ids == nullptr
+                   ? AAFRESULT_NULL_PARAM
+                   : PutSet(*this, prop::DescriptiveMarker_DescribedSlots,
+                            std::vector<aafUInt32>(ids, ids + numberElements), std::less<>());
     }
     HRESULT GetDescribedSlotIDs(aafUInt32 numberElements, aafUInt32* ids) override {
         return ReadArray(*this, prop::DescriptiveMarker_DescribedSlots, ids,

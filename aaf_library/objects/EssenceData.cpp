@@ -3,6 +3,7 @@
 #include "aaf_library/objects/EssenceData.h"
 
 #include "aaf_library/objects/ContentStorage.h"
+#include "aaf_library/objects/MobId.h"
 #include "aaf_library/objects/SourceMob.h"
 #include "aaf_library/objects/StreamAccess.h"
 #include "host_interfaces/aaf/AAFMobs.h"
@@ -28,7 +29,17 @@ HRESULT EssenceData::SetFileMob(IAAFSourceMob* fileMob) {
     if (mob == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }
-    return PutStruct(prop::EssenceData_MobID, mob->id());
+    // The content storage finds its essence by this id.
+    auto* const storage = dynamic_cast<ContentStorage*>(owner());
+    const aafMobID_t id = mob->id();
+    if (storage != nullptr && !(id == mobId()) && storage->FindEssence(id) != nullptr) {
+        return AAFRESULT_DUPLICATE_MOBID;
+    }
+    const HRESULT result = PutStruct(prop::EssenceData_MobID, id);
+    if (storage != nullptr) {
+        storage->SortSet(prop::ContentStorage_EssenceData);
+    }
+    return result;
 }
 
 HRESULT EssenceData::GetFileMob(IAAFSourceMob** fileMob) {

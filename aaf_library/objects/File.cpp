@@ -37,6 +37,7 @@ constexpr FailureCode kFailureCodes[] = {
     {stored::FileFailure::NotAaf, AAFRESULT_NOT_AAF_FILE},
     {stored::FileFailure::Damaged, AAFRESULT_READ_FAILURE},
     {stored::FileFailure::NotStorable, AAFRESULT_INVALID_OBJ},
+    {stored::FileFailure::TooLarge, AAFRESULT_DATA_SIZE},
     {stored::FileFailure::NoMemory, AAFRESULT_NOMEMORY},
 };
 
@@ -290,9 +291,8 @@ HRESULT File::CopyContentTo(File& target) {
     if (result < 0) {
         target.header_->KeepIdentifications(own);
     }
-    aafUID_t pattern{};
-    if (result >= 0 && header_->GetOperationalPattern(&pattern) >= 0) {
-        target.header_->SetOperationalPattern(pattern);
+    if (result >= 0) {
+        target.header_->AddSummaryOf(*header_);
     }
     return result;
 }
@@ -307,7 +307,7 @@ HRESULT File::TakeMobs(const ContentStorage& from) {
     }
     // All or nothing.
     while (result < 0 && to.MobCount() > 0) {
-        to.RemoveObjectAt(prop::ContentStorage_Mobs, 0);
+        to.RemoveCopy(*RefPtr<Mob>(to.MobAt(0)));
     }
     return result;
 }
@@ -326,10 +326,7 @@ bool File::CanSaveContentAs(const File& target) const {
 // content can't be stored: the way through a copy then finds out why, and leaves the target as it
 // has to. A target that only can't be written has its content all the same.
 bool File::SaveContentAs(File& target, HRESULT* result) {
-    aafUID_t pattern{};
-    if (header_->GetOperationalPattern(&pattern) >= 0) {
-        target.header_->SetOperationalPattern(pattern);
-    }
+    target.header_->AddSummaryOf(*header_);
     target.header_->Touch();
     const aafUInt32 own = target.header_->IdentificationCount();
     stored::FileResult saved{stored::FileFailure::NotStorable, {}};
@@ -339,7 +336,7 @@ bool File::SaveContentAs(File& target, HRESULT* result) {
     }
     if (saved.failure == stored::FileFailure::NotStorable ||
         saved.failure == stored::FileFailure::NoMemory) {
-        target.header_->RemoveValue(prop::Header_OperationalPattern);
+        target.header_->RemoveSummary();
         target.header_->KeepIdentifications(own);
         return false;
     }

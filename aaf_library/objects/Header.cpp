@@ -98,6 +98,30 @@ void Header::KeepIdentifications(aafUInt32 count) {
     }
 }
 
+void Header::AddSummaryOf(const Header& other) {
+    aafUID_t pattern{};
+    if (other.ReadStruct(prop::Header_OperationalPattern, &pattern) >= 0) {
+        SetOperationalPattern(pattern);
+    }
+    for (const PropertyKey& set :
+         {prop::Header_EssenceContainers, prop::Header_DescriptiveSchemes}) {
+        std::vector<aafUID_t> theirs;
+        std::vector<aafUID_t> ids;
+        if (ReadElements(other, set, theirs) >= 0) {
+            ReadElements(*this, set, ids);
+            ids.insert(ids.end(), theirs.begin(), theirs.end());
+            PutSet(*this, set, std::move(ids), PrecedesInBytes);
+        }
+    }
+}
+
+void Header::RemoveSummary() {
+    for (const PropertyKey& key : {prop::Header_OperationalPattern, prop::Header_EssenceContainers,
+                                   prop::Header_DescriptiveSchemes}) {
+        RemoveValue(key);
+    }
+}
+
 void Header::Touch() {
     PutStruct(prop::Header_LastModified, CurrentTime());
 }
@@ -218,16 +242,15 @@ HRESULT Header::GetNativeByteOrder(eAAFByteOrder_t* order) {
 }
 
 HRESULT Header::UpdateEssenceContainers() {
-    std::vector<aafUID_t> ids;
-    const ContentStorage* const storage = content();
-    for (aafUInt32 at = 0; storage != nullptr && at < storage->MobCount(); ++at) {
-        if (const auto* const mob = dynamic_cast<const SourceMob*>(storage->MobAt(at))) {
-            CollectContainers(mob->descriptor(), ids);
+    return OnContent([&](const ContentStorage& storage) {
+        std::vector<aafUID_t> ids;
+        for (aafUInt32 at = 0; at < storage.MobCount(); ++at) {
+            if (const auto* const mob = dynamic_cast<const SourceMob*>(storage.MobAt(at))) {
+                CollectContainers(mob->descriptor(), ids);
+            }
         }
-    }
-    std::sort(ids.begin(), ids.end(), PrecedesInBytes);
-    ids.erase(std::unique(ids.begin(), ids.end()), ids.end());
-    return PutSet(*this, prop::Header_EssenceContainers, std::move(ids), PrecedesInBytes);
+        return PutSet(*this, prop::Header_EssenceContainers, std::move(ids), PrecedesInBytes);
+    });
 }
 
 HRESULT Header::CountEssenceContainers(aafUInt32* count) {

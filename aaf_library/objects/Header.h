@@ -32,6 +32,10 @@ public:
     aafUInt32 IdentificationCount() const { return CountObjects(prop::Header_IdentificationList); }
     // Drops those behind the first ones.
     void KeepIdentifications(aafUInt32 count);
+    // Takes over what another file tells of the content that it hands on: its operational pattern,
+    // and its wrappings and schemes beside the own ones.
+    void AddSummaryOf(const Header& other);
+    void RemoveSummary();
     // To be called when the file is saved.
     void Touch();
 

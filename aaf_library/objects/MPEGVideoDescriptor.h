@@ -13,19 +13,13 @@ class MPEGVideoDescriptor : public Implements<CDCIDescriptor, IAAFMPEGVideoDescr
 public:
     HRESULT Initialize() override { return AAFRESULT_SUCCESS; }
     HRESULT SetSingleSequence(aafBoolean_t single) override {
-        if (!(IsBoolean(single))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::MPEGVideoDescriptor_SingleSequence, single);
+        return PutBoolean(prop::MPEGVideoDescriptor_SingleSequence, single);
     }
     HRESULT GetSingleSequence(aafBoolean_t* single) override {
         return ReadInteger(prop::MPEGVideoDescriptor_SingleSequence, single);
     }
     HRESULT SetConstantBPictureCount(aafBoolean_t constant) override {
-        if (!(IsBoolean(constant))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::MPEGVideoDescriptor_ConstantBPictureCount, constant);
+        return PutBoolean(prop::MPEGVideoDescriptor_ConstantBPictureCount, constant);
     }
     HRESULT GetConstantBPictureCount(aafBoolean_t* constant) override {
         return ReadInteger(prop::MPEGVideoDescriptor_ConstantBPictureCount, constant);
@@ -40,28 +34,19 @@ public:
         return ReadInteger(prop::MPEGVideoDescriptor_CodedContentScanning, scanning);
     }
     HRESULT SetLowDelay(aafBoolean_t low) override {
-        if (!(IsBoolean(low))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::MPEGVideoDescriptor_LowDelay, low);
+        return PutBoolean(prop::MPEGVideoDescriptor_LowDelay, low);
     }
     HRESULT GetLowDelay(aafBoolean_t* low) override {
         return ReadInteger(prop::MPEGVideoDescriptor_LowDelay, low);
     }
     HRESULT SetClosedGOP(aafBoolean_t closed) override {
-        if (!(IsBoolean(closed))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::MPEGVideoDescriptor_ClosedGOP, closed);
+        return PutBoolean(prop::MPEGVideoDescriptor_ClosedGOP, closed);
     }
     HRESULT GetClosedGOP(aafBoolean_t* closed) override {
         return ReadInteger(prop::MPEGVideoDescriptor_ClosedGOP, closed);
     }
     HRESULT SetIdenticalGOP(aafBoolean_t identical) override {
-        if (!(IsBoolean(identical))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::MPEGVideoDescriptor_IdenticalGOP, identical);
+        return PutBoolean(prop::MPEGVideoDescriptor_IdenticalGOP, identical);
     }
     HRESULT GetIdenticalGOP(aafBoolean_t* identical) override {
         return ReadInteger(prop::MPEGVideoDescriptor_IdenticalGOP, identical);

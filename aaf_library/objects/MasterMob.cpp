@@ -14,16 +14,14 @@ HRESULT MasterMob::ReadSource(IAAFSourceMob* sourceMob, aafSlotID_t slotId, Sour
     if (mob == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }
-    MobSlot* const slot = mob->FindSlot(slotId);
+    const MobSlot* const slot = mob->FindSlot(slotId);
     if (slot == nullptr) {
         return AAFRESULT_SLOT_NOT_FOUND;
     }
     if (slot->segment() == nullptr) {
         return AAFRESULT_NULLOBJECT;
     }
-    if (TimelineMobSlot* const timeline = dynamic_cast<TimelineMobSlot*>(slot)) {
-        timeline->GetEditRate(&source.rate);
-    }
+    source.rate = slot->editRate();
     source.reference = aafSourceRef_t{mob->id(), slotId, 0};
     source.length = slot->segment()->IntegerOr(prop::Component_Length, -1);
     return AAFRESULT_SUCCESS;

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 // The operations of a mob that reach other mobs and files.
 #include <functional>
+#include <vector>
 
 #include "aaf_library/model/Model.h"
 #include "aaf_library/objects/Checks.h"
@@ -28,6 +29,54 @@ void ForEachReference(const Object& object, const std::function<void(SourceRefer
         }
     }
 }
+
+// Copies a mob and, if wanted, those that it leads to: all of them or none. Those that are there
+// already are taken as they are, so circles end; a way may be as long as a file has mobs.
+class Cloning {
+public:
+    Cloning(ContentStorage& target, bool withEssence)
+        : target_(target), withEssence_(withEssence) {}
+
+    HRESULT Add(const Mob& mob) {
+        RefPtr<Mob> copy;
+        const HRESULT result = target_.AddCopy(mob, withEssence_, copy);
+        if (result >= 0) {
+            copies_.push_back(copy);
+            waiting_.push_back(&mob);
+        }
+        return result;
+    }
+
+    HRESULT AddReferredTo(const ContentStorage& source) {
+        HRESULT result = AAFRESULT_SUCCESS;
+        while (result >= 0 && !waiting_.empty()) {
+            const Mob& mob = *waiting_.back();
+            waiting_.pop_back();
+            ForEachReference(mob, [&](const SourceReference& reference) {
+                aafMobID_t id{};
+                reference.ReadStruct(prop::SourceReference_SourceID, &id);
+                const Mob* const needed = source.FindMob(id);
+                if (needed != nullptr && target_.FindMob(id) == nullptr && result >= 0) {
+                    result = Add(*needed);
+                }
+            });
+        }
+        return result;
+    }
+
+    const RefPtr<Mob>& first() const { return copies_.front(); }
+    void TakeBack() {
+        for (const RefPtr<Mob>& copy : copies_) {
+            target_.RemoveCopy(*copy);
+        }
+    }
+
+private:
+    ContentStorage& target_;
+    bool withEssence_;
+    std::vector<RefPtr<Mob>> copies_;
+    std::vector<const Mob*> waiting_;  // whose references were not followed yet
+};
 
 }  // namespace
 
@@ -58,29 +107,17 @@ HRESULT Mob::CloneExternal(aafDepend_t resolveDependencies, aafIncMedia_t includ
     if (target == nullptr) {
         return AAFRESULT_NOT_OPEN;
     }
-    RefPtr<Mob> copy;
-    HRESULT result = target->AddCopy(*this, includeMedia == kAAFIncludeMedia, copy);
+    Cloning cloning(*target, includeMedia == kAAFIncludeMedia);
+    HRESULT result = cloning.Add(*this);
+    const auto* const source = dynamic_cast<const ContentStorage*>(owner());
+    if (result >= 0 && resolveDependencies == kAAFFollowDepend && source != nullptr) {
+        result = cloning.AddReferredTo(*source);
+    }
     if (result < 0) {
+        cloning.TakeBack();
         return result;
     }
-    // Mobs that are there already are taken as they are, so circles end.
-    ContentStorage* const source = dynamic_cast<ContentStorage*>(owner());
-    if (resolveDependencies == kAAFFollowDepend && source != nullptr) {
-        ForEachReference(*this, [&](SourceReference& reference) {
-            aafMobID_t id{};
-            reference.GetSourceID(&id);
-            Mob* const needed = source->FindMob(id);
-            if (needed == nullptr || target->FindMob(id) != nullptr || result < 0) {
-                return;
-            }
-            IAAFMob* ignored = nullptr;
-            result = needed->CloneExternal(resolveDependencies, includeMedia, destFile, &ignored);
-            if (ignored != nullptr) {
-                ignored->Release();
-            }
-        });
-    }
-    return result < 0 ? result : GiveOut(copy.get(), destMob);
+    return GiveOut(cloning.first().get(), destMob);
 }
 
 HRESULT Mob::Copy(aafCharacter_constptr destMobName, IAAFMob** destMob) {

@@ -22,6 +22,14 @@ void MobSlot::OnValueChange(const PropertyValue& value) {
     }
 }
 
+aafRational_t MobSlot::editRate() const {
+    aafRational_t rate{};
+    if (ReadStruct(prop::TimelineMobSlot_EditRate, &rate) < 0) {
+        ReadStruct(prop::EventMobSlot_EditRate, &rate);
+    }
+    return rate;
+}
+
 Segment* MobSlot::segment() const {
     return dynamic_cast<Segment*>(ObjectAt(prop::MobSlot_Segment));
 }

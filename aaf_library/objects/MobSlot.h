@@ -45,6 +45,8 @@ public:
         return PutInteger(prop::MobSlot_SlotID, value);
     }
 
+    // Of a slot with a timeline or with events; 0/0 for others.
+    aafRational_t editRate() const;
     Segment* segment() const;
     aafSlotID_t id() const;
 };

@@ -27,10 +27,10 @@ HRESULT ReadTyped(const Object& object, const PropertyKey& key, aafUInt32 valueS
 }
 
 // The first value, of the type that a parameter has by its definition.
-HRESULT PutFirst(Object& object, const PropertyKey& key, Parameter& parameter, aafUInt32 valueSize,
-                 aafDataBuffer_t value) {
+HRESULT PutFirst(Object& object, const PropertyKey& key, ParameterDefinition& definition,
+                 aafUInt32 valueSize, aafDataBuffer_t value) {
     IAAFTypeDef* type = nullptr;
-    const HRESULT result = parameter.Parameter::GetTypeDefinition(&type);
+    const HRESULT result = definition.GetTypeDefinition(&type);
     if (result < 0) {
         return result;
     }
@@ -41,16 +41,8 @@ HRESULT PutFirst(Object& object, const PropertyKey& key, Parameter& parameter, a
 // Another value of the same type.
 HRESULT PutNext(Object& object, const PropertyKey& key, aafUInt32 valueSize,
                 aafDataBuffer_t value) {
-    if (value == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
-    IAAFTypeDef* type = nullptr;
-    const HRESULT result = object.ReadIndirectType(key, &type);
-    if (result < 0) {
-        return result == AAFRESULT_PROP_NOT_PRESENT ? AAFRESULT_NOT_INITIALIZED : result;
-    }
-    const RefPtr<IAAFTypeDef> holder = RefPtr<IAAFTypeDef>::Adopt(type);
-    return object.PutIndirect(key, type, value, valueSize);
+    const HRESULT result = object.ReplaceIndirect(key, value, valueSize);
+    return result == AAFRESULT_PROP_NOT_PRESENT ? AAFRESULT_NOT_INITIALIZED : result;
 }
 
 }  // namespace
@@ -144,43 +136,45 @@ HRESULT OperationGroup::IsValidTranOperation(aafBoolean_t* validTransition) {
 
 // Parameters
 
-HRESULT Parameter::GetParameterDefinition(IAAFParameterDef** parmDef) {
+HRESULT Parameter::FindDefinition(ParameterDefinition** definition) const {
     aafUID_t id{};
-    if (parmDef == nullptr) {
-        return AAFRESULT_NULL_PARAM;
-    }
     if (const HRESULT result = ReadStruct(prop::Parameter_Definition, &id); result < 0) {
         return result;
     }
-    Unknown* const definition = model()->FindTarget(AUID_AAFParameterDef, id);
-    return definition == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : GiveOut(definition, parmDef);
+    *definition = dynamic_cast<ParameterDefinition*>(model()->FindTarget(AUID_AAFParameterDef, id));
+    return *definition == nullptr ? AAFRESULT_OBJECT_NOT_FOUND : AAFRESULT_SUCCESS;
+}
+
+HRESULT Parameter::GetParameterDefinition(IAAFParameterDef** parmDef) {
+    if (parmDef == nullptr) {
+        return AAFRESULT_NULL_PARAM;
+    }
+    ParameterDefinition* definition = nullptr;
+    const HRESULT result = FindDefinition(&definition);
+    return result < 0 ? result : GiveOut(definition, parmDef);
 }
 
 HRESULT Parameter::GetTypeDefinition(IAAFTypeDef** typeDef) {
     if (typeDef == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    IAAFParameterDef* definition = nullptr;
-    const HRESULT result = GetParameterDefinition(&definition);
-    if (result < 0) {
-        return result;
-    }
-    const RefPtr<IAAFParameterDef> holder = RefPtr<IAAFParameterDef>::Adopt(definition);
-    return definition->GetTypeDefinition(typeDef);
+    ParameterDefinition* definition = nullptr;
+    const HRESULT result = FindDefinition(&definition);
+    return result < 0 ? result : definition->GetTypeDefinition(typeDef);
 }
 
-HRESULT Parameter::PutParameterDefinition(IAAFParameterDef* argument) {
-    const auto* const definition = ImplementationAs<ParameterDefinition>(argument);
-    if (definition == nullptr) {
+HRESULT Parameter::TakeDefinition(IAAFParameterDef* argument,
+                                  ParameterDefinition** definition) const {
+    const auto* const given = ImplementationAs<ParameterDefinition>(argument);
+    if (given == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }
-    if (definition->owner() == nullptr) {
+    if (given->owner() == nullptr) {
         return AAFRESULT_OBJECT_NOT_ATTACHED;
     }
-    const aafUID_t id = definition->Identification();
-    return model()->FindTarget(AUID_AAFParameterDef, id) == nullptr
-               ? AAFRESULT_INVALID_OBJ
-               : PutStruct(prop::Parameter_Definition, id);
+    *definition = dynamic_cast<ParameterDefinition*>(
+        model()->FindTarget(AUID_AAFParameterDef, given->Identification()));
+    return *definition == nullptr ? AAFRESULT_INVALID_OBJ : AAFRESULT_SUCCESS;
 }
 
 HRESULT ConstantValue::Initialize(IAAFParameterDef* parameterDef, aafUInt32 valueSize,
@@ -191,9 +185,13 @@ HRESULT ConstantValue::Initialize(IAAFParameterDef* parameterDef, aafUInt32 valu
     if (IsPresent(prop::ConstantValue_Value)) {
         return AAFRESULT_ALREADY_INITIALIZED;
     }
-    const HRESULT result = PutParameterDefinition(parameterDef);
+    ParameterDefinition* definition = nullptr;
+    HRESULT result = TakeDefinition(parameterDef, &definition);
+    if (result >= 0) {
+        result = PutFirst(*this, prop::ConstantValue_Value, *definition, valueSize, value);
+    }
     return result < 0 ? result
-                      : PutFirst(*this, prop::ConstantValue_Value, *this, valueSize, value);
+                      : PutStruct(prop::Parameter_Definition, definition->Identification());
 }
 
 HRESULT ConstantValue::SetValue(aafUInt32 valueSize, aafDataBuffer_t value) {
@@ -208,8 +206,13 @@ HRESULT VaryingValue::Initialize(IAAFParameterDef* parameterDef,
     if (IsPresent(prop::VaryingValue_Interpolation)) {
         return AAFRESULT_ALREADY_INITIALIZED;
     }
-    const HRESULT result = PutParameterDefinition(parameterDef);
-    return result < 0 ? result : PutWeak(prop::VaryingValue_Interpolation, interpolation);
+    ParameterDefinition* definition = nullptr;
+    HRESULT result = TakeDefinition(parameterDef, &definition);
+    if (result >= 0) {
+        result = PutWeak(prop::VaryingValue_Interpolation, interpolation);
+    }
+    return result < 0 ? result
+                      : PutStruct(prop::Parameter_Definition, definition->Identification());
 }
 
 HRESULT VaryingValue::GetValueBufLen(aafInt32* len) {
@@ -235,14 +238,18 @@ HRESULT ControlPoint::Initialize(IAAFVaryingValue* varyingValue, aafRational_con
     if (varyingValue == nullptr || value == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    auto* const parameter = ImplementationAs<Parameter>(varyingValue);
+    const auto* const parameter = ImplementationAs<Parameter>(varyingValue);
     if (parameter == nullptr) {
         return AAFRESULT_INVALID_OBJ;
     }
     if (IsPresent(prop::ControlPoint_Value)) {
         return AAFRESULT_ALREADY_INITIALIZED;
     }
-    const HRESULT result = PutFirst(*this, prop::ControlPoint_Value, *parameter, valueSize, value);
+    ParameterDefinition* definition = nullptr;
+    HRESULT result = parameter->FindDefinition(&definition);
+    if (result >= 0) {
+        result = PutFirst(*this, prop::ControlPoint_Value, *definition, valueSize, value);
+    }
     return result < 0 ? result : SetTime(time);
 }
 
@@ -359,10 +366,7 @@ HRESULT CommentMarker::SetAnnotation(IAAFSourceReference* annotation) {
 }
 
 HRESULT GPITrigger::SetActiveState(aafBoolean_t activeState) {
-    if (!IsBoolean(activeState)) {
-        return AAFRESULT_INVALID_ENUM_VALUE;
-    }
-    return PutInteger(prop::GPITrigger_ActiveState, activeState);
+    return PutBoolean(prop::GPITrigger_ActiveState, activeState);
 }
 
 }  // namespace aaf

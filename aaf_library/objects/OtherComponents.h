@@ -101,11 +101,12 @@ class Parameter : public Implements<Object, IAAFParameter> {
 public:
     HRESULT GetParameterDefinition(IAAFParameterDef** parmDef) override;
     HRESULT GetTypeDefinition(IAAFTypeDef** typeDef) override;
+    HRESULT FindDefinition(ParameterDefinition** definition) const;
 
 protected:
-    // A definition of the dictionary: a free one is AAFRESULT_OBJECT_NOT_ATTACHED, that of another
-    // file AAFRESULT_INVALID_OBJ.
-    HRESULT PutParameterDefinition(IAAFParameterDef* definition);
+    // The dictionary's definition with the id of the argument: a free one is
+    // AAFRESULT_OBJECT_NOT_ATTACHED, one that only another file has AAFRESULT_INVALID_OBJ.
+    HRESULT TakeDefinition(IAAFParameterDef* argument, ParameterDefinition** definition) const;
 };
 
 class ConstantValue : public Implements<Parameter, IAAFConstantValue> {

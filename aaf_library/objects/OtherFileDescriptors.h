@@ -54,19 +54,13 @@ public:
         return PutNative(prop::TIFFDescriptor_Summary, summary, size);
     }
     HRESULT SetIsUniform(aafBoolean_t uniform) override {
-        if (!(IsBoolean(uniform))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::TIFFDescriptor_IsUniform, uniform);
+        return PutBoolean(prop::TIFFDescriptor_IsUniform, uniform);
     }
     HRESULT GetIsUniform(aafBoolean_t* uniform) override {
         return ReadInteger(prop::TIFFDescriptor_IsUniform, uniform);
     }
     HRESULT SetIsContiguous(aafBoolean_t contiguous) override {
-        if (!(IsBoolean(contiguous))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::TIFFDescriptor_IsContiguous, contiguous);
+        return PutBoolean(prop::TIFFDescriptor_IsContiguous, contiguous);
     }
     HRESULT GetIsContiguous(aafBoolean_t* contiguous) override {
         return ReadInteger(prop::TIFFDescriptor_IsContiguous, contiguous);

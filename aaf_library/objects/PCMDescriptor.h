@@ -10,7 +10,8 @@
 namespace aaf {
 
 // Sound as plain samples. Its own operations and the setters of any sound need Initialize, which
-// takes the sound's values back to their defaults.
+// takes the sound's values back to their defaults. What is no member of an enumeration is refused
+// before that.
 class PCMDescriptor : public Implements<SoundDescriptor, IAAFPCMDescriptor> {
 public:
     HRESULT Initialize() override;
@@ -29,11 +30,11 @@ public:
                                [&] { return SoundDescriptor::SetAudioSamplingRate(rate); });
     }
     HRESULT SetIsLocked(aafBoolean_t locked) override {
-        return OnceInitialized(IsInitialized(),
+        return OnceInitialized(IsInitialized() || !IsBoolean(locked),
                                [&] { return SoundDescriptor::SetIsLocked(locked); });
     }
     HRESULT SetElectroSpatialFormulation(aafElectroSpatialFormulation_t formulation) override {
-        return OnceInitialized(IsInitialized(), [&] {
+        return OnceInitialized(IsInitialized() || !IsFormulation(formulation), [&] {
             return SoundDescriptor::SetElectroSpatialFormulation(formulation);
         });
     }

@@ -171,6 +171,17 @@ HRESULT Sequence::GetComponents(IEnumAAFComponents** enumerator) {
     return MakeEnumerator<IAAFComponent>(this, prop::Sequence_Components, enumerator);
 }
 
+bool Sequence::HasTimecode() const {
+    const aafUInt32 count = CountObjects(prop::Sequence_Components);
+    for (aafUInt32 at = 0; at < count; ++at) {
+        const auto* const part = dynamic_cast<const Segment*>(ComponentAt(at));
+        if (part != nullptr && part->HasTimecode()) {
+            return true;
+        }
+    }
+    return false;
+}
+
 HRESULT Sequence::SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) {
     if (offset == nullptr || timecode == nullptr) {
         return AAFRESULT_NULL_PARAM;
@@ -189,7 +200,7 @@ HRESULT Sequence::SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timeco
         }
         start = end;
     }
-    return AAFRESULT_BADSAMPLEOFFSET;
+    return HasTimecode() ? AAFRESULT_BADSAMPLEOFFSET : AAFRESULT_TIMECODE_NOT_FOUND;
 }
 
 HRESULT Sequence::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
@@ -197,6 +208,7 @@ HRESULT Sequence::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* edit
     if (timecode == nullptr || editRate == nullptr || offset == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
+    // The last stretch of timecode tells why there is none.
     HRESULT result = AAFRESULT_TIMECODE_NOT_FOUND;
     aafPosition_t start = 0;
     const aafUInt32 count = CountObjects(prop::Sequence_Components);
@@ -206,10 +218,13 @@ HRESULT Sequence::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* edit
             return AAFRESULT_TIMECODE_NOT_FOUND;
         }
         aafFrameOffset_t inside = 0;
-        result = part->SegmentTCToOffset(timecode, editRate, &inside);
-        if (result >= 0) {
+        const HRESULT found = part->SegmentTCToOffset(timecode, editRate, &inside);
+        if (found >= 0) {
             *offset = Plus(start, inside);
-            return result;
+            return found;
+        }
+        if (found != AAFRESULT_TIMECODE_NOT_FOUND) {
+            result = found;
         }
         start = Plus(start, LengthOf(*part));
     }

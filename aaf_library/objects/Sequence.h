@@ -37,6 +37,7 @@ public:
     HRESULT SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) override;
     HRESULT SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
                               aafFrameOffset_t* offset) override;
+    bool HasTimecode() const override;
 
 private:
     // Whether a component of this data definition may stand in the sequence.

@@ -37,20 +37,15 @@ public:
         return ReadStruct(prop::SoundDescriptor_AudioSamplingRate, rate);
     }
     HRESULT SetIsLocked(aafBoolean_t locked) override {
-        if (!(IsBoolean(locked))) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::SoundDescriptor_Locked, locked);
+        return PutBoolean(prop::SoundDescriptor_Locked, locked);
     }
     HRESULT IsLocked(aafBoolean_t* locked) override {
         return ReadInteger(prop::SoundDescriptor_Locked, locked);
     }
     HRESULT SetElectroSpatialFormulation(aafElectroSpatialFormulation_t formulation) override {
-        // 5 and 6 and 10 to 14 are no members.
-        if (!IsWithin(formulation, 0, 4) && !IsWithin(formulation, 7, 9) && formulation != 15) {
-            return AAFRESULT_INVALID_ENUM_VALUE;
-        }
-        return PutInteger(prop::SoundDescriptor_ElectroSpatial, formulation);
+        return IsFormulation(formulation)
+                   ? PutInteger(prop::SoundDescriptor_ElectroSpatial, formulation)
+                   : AAFRESULT_INVALID_ENUM_VALUE;
     }
     HRESULT GetElectroSpatialFormulation(aafElectroSpatialFormulation_t* formulation) override {
         return ReadInteger(prop::SoundDescriptor_ElectroSpatial, formulation);
@@ -72,6 +67,12 @@ public:
     }
     HRESULT GetQuantizationBits(aafUInt32* bitsCount) override {
         return ReadInteger(prop::SoundDescriptor_QuantizationBits, bitsCount);
+    }
+
+protected:
+    // 5 and 6 and 10 to 14 are no members.
+    static bool IsFormulation(aafElectroSpatialFormulation_t value) {
+        return IsWithin(value, 0, 4) || IsWithin(value, 7, 9) || value == 15;
     }
 };
 

@@ -66,8 +66,7 @@ HRESULT SourceMob::AppendEdgecodeSlot(aafRational_t editrate, aafInt32 slotID,
                                       aafFrameOffset_t startEC, aafFrameLength_t length32,
                                       aafFilmType_t filmKind, aafEdgeType_t codeFormat,
                                       aafEdgecodeHeader_t header) {
-    if (!IsWithin(filmKind, kAAFFtNull, kAAFFt65MM) ||
-        (!IsWithin(codeFormat, kAAFEtNull, kAAFEtEdgenum5) && codeFormat != kAAFEtHeaderSize)) {
+    if (!Edgecode::IsKnown(filmKind, codeFormat)) {
         return AAFRESULT_INVALID_ENUM_VALUE;
     }
     if (header == nullptr) {

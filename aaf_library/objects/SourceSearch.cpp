@@ -20,15 +20,31 @@ namespace {
 // References that lead round and round end here.
 constexpr int kMostMobs = 100;
 
-// A component, and a position in it.
+// A component, a position in it, and how much is wanted from there; below zero: not known.
 struct At {
     const Component* component = nullptr;
     aafPosition_t position = 0;
+    aafLength_t length = -1;
 };
 
 // No file can make it less than nothing.
 aafLength_t KnownLength(const Object& component) {
     return std::max<aafLength_t>(component.IntegerOr(prop::Component_Length, 0), 0);
+}
+
+// No more can be wanted than a component has left; nothing is told of one without length.
+void Limit(At& at) {
+    if (at.component->IsPresent(prop::Component_Length)) {
+        const aafLength_t left =
+            std::max<aafLength_t>(Minus(KnownLength(*at.component), at.position), 0);
+        at.length = at.length < 0 ? left : std::min(at.length, left);
+    }
+}
+
+// A component without frames has its start, as a still.
+bool IsInside(const Component& component, aafPosition_t position) {
+    return position == 0 || (position > 0 && (!component.IsPresent(prop::Component_Length) ||
+                                              position < KnownLength(component)));
 }
 
 const Component* PartOf(const Object& object, const PropertyKey& key, std::size_t index = 0) {
@@ -48,10 +64,10 @@ HRESULT IntoSequence(const Sequence& sequence, aafOperationChoice_t choice, At& 
         if (dynamic_cast<const Transition*>(part) == nullptr) {
             const Component* const next = PartOf(sequence, prop::Sequence_Components, index + 1);
             const bool blends = dynamic_cast<const Transition*>(next) != nullptr;
-            before = At{part, start};
+            before = At{part, start, at.length};
             const aafPosition_t end = Plus(start, length);
             if (at.position < (blends ? Minus(end, KnownLength(*next)) : end)) {
-                at = At{part, Minus(at.position, start)};
+                at = At{part, Minus(at.position, start), at.length};
                 return AAFRESULT_SUCCESS;
             }
             start = end;
@@ -64,8 +80,9 @@ HRESULT IntoSequence(const Sequence& sequence, aafOperationChoice_t choice, At& 
             continue;
         }
         at = choice == kAAFFindOutgoing
-                 ? At{before.component, Minus(at.position, before.position)}
-                 : At{PartOf(*part, prop::Transition_OperationGroup), Minus(at.position, start)};
+                 ? At{before.component, Minus(at.position, before.position), at.length}
+                 : At{PartOf(*part, prop::Transition_OperationGroup), Minus(at.position, start),
+                      at.length};
         return at.component == nullptr ? AAFRESULT_TRAVERSAL_NOT_POSS : AAFRESULT_SUCCESS;
     }
     return AAFRESULT_TRAVERSAL_NOT_POSS;
@@ -94,7 +111,9 @@ HRESULT StepInto(aafOperationChoice_t choice, At& at) {
         return IntoGroup(*group, choice, at);
     }
     if (const auto* const pulldown = dynamic_cast<const Pulldown*>(&whole)) {
-        at.position = PulldownRatioOf(*pulldown).ToInput(at.position);
+        const PulldownRatio ratio = PulldownRatioOf(*pulldown);
+        at.position = ratio.ToInput(at.position);
+        at.length = at.length < 0 ? at.length : ratio.ToInput(at.length);
         at.component = PartOf(whole, prop::Pulldown_InputSegment);
     } else if (dynamic_cast<const Selector*>(&whole) != nullptr) {
         at.component = PartOf(whole, prop::Selector_Selected);
@@ -112,20 +131,14 @@ HRESULT StepInto(aafOperationChoice_t choice, At& at) {
 
 // The source clip at a place, and the position in it.
 HRESULT FindClip(aafOperationChoice_t choice, At& at) {
+    Limit(at);
     while (dynamic_cast<const SourceClip*>(at.component) == nullptr) {
         if (const HRESULT result = StepInto(choice, at); result < 0) {
             return result;
         }
+        Limit(at);
     }
-    return AAFRESULT_SUCCESS;
-}
-
-aafRational_t RateOf(const MobSlot& slot) {
-    aafRational_t rate{};
-    if (slot.ReadStruct(prop::TimelineMobSlot_EditRate, &rate) < 0) {
-        slot.ReadStruct(prop::EventMobSlot_EditRate, &rate);
-    }
-    return rate;
+    return IsInside(*at.component, at.position) ? AAFRESULT_SUCCESS : AAFRESULT_TRAVERSAL_NOT_POSS;
 }
 
 bool IsOfKind(const Mob& mob, aafMobKind_t kind) {
@@ -143,7 +156,8 @@ HRESULT Follow(const ContentStorage& storage, aafOperationChoice_t choice, Sourc
         return AAFRESULT_SLOT_NOT_FOUND;
     }
     At at{slot->segment(),
-          Plus(place.reference.startTime, slot->IntegerOr(prop::TimelineMobSlot_Origin, 0))};
+          Plus(place.reference.startTime, slot->IntegerOr(prop::TimelineMobSlot_Origin, 0)),
+          place.length};
     if (at.component == nullptr) {
         return AAFRESULT_NULLOBJECT;
     }
@@ -167,13 +181,11 @@ HRESULT Follow(const ContentStorage& storage, aafOperationChoice_t choice, Sourc
     if (next == nullptr) {
         return AAFRESULT_SLOT_NOT_FOUND;
     }
-    const aafRational_t from = RateOf(*slot);
-    place.editRate = RateOf(*next);
+    const aafRational_t from = slot->editRate();
+    place.editRate = next->editRate();
     const aafPosition_t start = Plus(clip.IntegerOr(prop::SourceClip_StartTime, 0), at.position);
     place.reference = {id, slotId, Rescaled(start, from, place.editRate)};
-    place.length = clip.IsPresent(prop::Component_Length)
-                       ? Rescaled(Minus(KnownLength(clip), at.position), from, place.editRate)
-                       : -1;
+    place.length = at.length < 0 ? at.length : Rescaled(at.length, from, place.editRate);
     return AAFRESULT_SUCCESS;
 }
 
@@ -190,8 +202,8 @@ public:
     }
     // AAFRESULT_PROP_NOT_PRESENT for a length that isn't known.
     HRESULT GetLength(aafLength_t* length) override {
-        const HRESULT result = Copy(place_.length, length);
-        return result >= 0 && place_.length < 0 ? AAFRESULT_PROP_NOT_PRESENT : result;
+        return length != nullptr && place_.length < 0 ? AAFRESULT_PROP_NOT_PRESENT
+                                                      : Copy(place_.length, length);
     }
     HRESULT GetEditRate(aafRational_t* editRate) override {
         return Copy(place_.editRate, editRate);

@@ -6,11 +6,11 @@
 
 namespace aaf {
 
-// A place in a slot of a mob, and how much follows there.
+// A place in a slot of a mob, and how much of what led there follows.
 struct SourcePlace {
     RefPtr<Mob> mob;
     aafSourceRef_t reference{};  // from the origin of the slot
-    aafLength_t length = -1;     // below zero: not known
+    aafLength_t length = -1;     // that the whole way has; below zero: not known
     aafRational_t editRate{};    // of the slot; 0/0 where it has none
 };
 
@@ -22,7 +22,8 @@ struct SourcePlace {
 //   scope the last slot. An effect with one input is passed through; one with several by
 //   `choice`, which also tells the side of a transition.
 //
-// AAFRESULT_TRAVERSAL_NOT_POSS when there is no such mob or no way on, AAFRESULT_FILL_FOUND and
+// AAFRESULT_TRAVERSAL_NOT_POSS when there is no such mob, no way on, or a clip doesn't reach as far
+// as the position in it, AAFRESULT_FILL_FOUND and
 // AAFRESULT_NOT_SOURCE_CLIP for what ends a way, AAFRESULT_MOB_NOT_FOUND and
 // AAFRESULT_SLOT_NOT_FOUND for a reference that leads out of the file.
 HRESULT FindSource(Mob& start, aafSlotID_t slotId, aafPosition_t offset, aafMobKind_t kind,

@@ -33,7 +33,7 @@ HRESULT ReadStream(const Object& object, const PropertyKey& key, aafUInt32 bytes
         return AAFRESULT_PROP_NOT_PRESENT;
     }
     const Bytes& content = stream->bytes();
-    const std::size_t at = std::min(static_cast<std::size_t>(stream->position()), content.size());
+    const auto at = static_cast<std::size_t>(stream->position());
     const std::size_t there = std::min<std::size_t>(bytes, content.size() - at);
     std::copy_n(content.begin() + static_cast<std::ptrdiff_t>(at), there, buffer);
     stream->SetPosition(at + there);

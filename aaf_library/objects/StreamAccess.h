@@ -9,9 +9,12 @@
 
 namespace aaf {
 
-// For a stream that a class must have: a file leaves it out while it is empty.
+// For a stream that a class must have: a file leaves it out while it is empty. What is kept as it
+// is stored stays until it is written over.
 inline const PropertyKey& Required(Object& object, const PropertyKey& key) {
-    object.RequireValue(key);
+    if (object.values().Find(key.pid) == nullptr) {
+        object.RequireValue(key);
+    }
     return key;
 }
 

@@ -81,13 +81,8 @@ HRESULT TaggedValue::SetValue(aafUInt32 valueSize, aafDataBuffer_t value) {
     if (value == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    IAAFTypeDef* found = nullptr;
-    const HRESULT result = GetTypeDefinition(&found);
-    if (result < 0) {
-        return result;
-    }
-    const RefPtr<IAAFTypeDef> type = RefPtr<IAAFTypeDef>::Adopt(found);
-    return PutIndirect(prop::TaggedValue_Value, type.get(), value, valueSize);
+    return IsInitialized() ? ReplaceIndirect(prop::TaggedValue_Value, value, valueSize)
+                           : AAFRESULT_ILLEGAL_VALUE;
 }
 
 }  // namespace aaf

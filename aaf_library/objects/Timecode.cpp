@@ -76,18 +76,17 @@ HRESULT Timecode::Store(const aafTimecode_t& timecode) {
 }
 
 HRESULT Timecode::SegmentOffsetToTC(aafPosition_t* offset, aafTimecode_t* timecode) {
-    if (offset == nullptr) {
+    if (offset == nullptr || timecode == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    const HRESULT result = GetTimecode(timecode);
-    if (result < 0) {
+    aafTimecode_t found{};
+    if (const HRESULT result = GetTimecode(&found); result < 0) {
         return result;
     }
-    aafPosition_t sum = 0;
-    if (__builtin_add_overflow(timecode->startFrame, *offset, &sum)) {
+    if (__builtin_add_overflow(found.startFrame, *offset, &found.startFrame)) {
         return AAFRESULT_INVALID_PARAM;
     }
-    timecode->startFrame = sum;
+    *timecode = found;
     return AAFRESULT_SUCCESS;
 }
 
@@ -117,8 +116,13 @@ HRESULT Timecode::SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* edit
     return AAFRESULT_SUCCESS;
 }
 
+bool Edgecode::IsKnown(aafFilmType_t filmKind, aafEdgeType_t codeFormat) {
+    return IsWithin(filmKind, kAAFFtNull, kAAFFt65MM) &&
+           (IsWithin(codeFormat, kAAFEtNull, kAAFEtEdgenum5) || codeFormat == kAAFEtHeaderSize);
+}
+
 HRESULT Edgecode::Initialize(aafLength_t length, aafEdgecode_t edgecode) {
-    if (!IsWithin(edgecode.filmKind, kAAFFtNull, kAAFFt65MM)) {
+    if (!IsKnown(edgecode.filmKind, edgecode.codeFormat)) {
         return AAFRESULT_INVALID_ENUM_VALUE;
     }
     HRESULT result = SetLength(length);

@@ -20,6 +20,7 @@ public:
     // AAFRESULT_BADSAMPLEOFFSET.
     HRESULT SegmentTCToOffset(aafTimecode_t* timecode, aafRational_t* editRate,
                               aafFrameOffset_t* offset) override;
+    bool HasTimecode() const override { return true; }
 
 private:
     bool IsInitialized() const { return IsPresent(prop::Timecode_Start); }
@@ -29,6 +30,9 @@ private:
 // Edge code of film that counts on from a start.
 class Edgecode : public Implements<Segment, IAAFEdgecode> {
 public:
+    // Whether both are members of their enumerations.
+    static bool IsKnown(aafFilmType_t filmKind, aafEdgeType_t codeFormat);
+
     HRESULT Initialize(aafLength_t length, aafEdgecode_t edgecode) override;
     HRESULT GetEdgecode(aafEdgecode_t* edgecode) override;
 };

@@ -19,6 +19,11 @@ constexpr std::uint8_t kDropFlag = 0x04;  // beside the tens of frames
 
 constexpr aafInt64 kMinutesOfADay = 24 * 60;
 
+// Only counts of 30 and its multiples drop numbers. For others the flag has no meaning.
+bool MayDrop(aafInt64 fps) {
+    return fps % 30 == 0;
+}
+
 // The numbers dropped at the start of each minute but every tenth.
 aafInt64 DroppedNumbers(aafInt64 fps) {
     return fps / 15;
@@ -171,7 +176,7 @@ HRESULT TimecodeStream::GetPositionTimecode(aafPosition_t position, aafTimecode_
         return AAFRESULT_BADRATE;
     }
     const std::uint8_t* const word = FindValue(prop::TimecodeStream_Source)->bytes().data() + at;
-    const bool drop = (word[1] & kDropFlag) != 0;
+    const bool drop = MayDrop(fps) && (word[1] & kDropFlag) != 0;
     const Clock clock{DigitsOf(word + 6, 0x03), DigitsOf(word + 4, 0x07), DigitsOf(word + 2, 0x07),
                       DigitsOf(word, 0x03)};
     *timecode = aafTimecode_t{CountOf(clock, fps, drop), drop ? kAAFTcDrop : kAAFTcNonDrop,
@@ -184,7 +189,7 @@ HRESULT TimecodeStream::SetPositionTimecode(aafPosition_t position, aafTimecode_
     if (fps == 0) {
         return AAFRESULT_BADRATE;
     }
-    const bool drop = timecode.drop == kAAFTcDrop;
+    const bool drop = MayDrop(fps) && timecode.drop == kAAFTcDrop;
     const aafInt64 day = CountOf({kMinutesOfADay / 60, 0, 0, 0}, fps, drop);
     if ((!drop && timecode.drop != kAAFTcNonDrop) || timecode.fps != fps || fps > 40 ||
         timecode.startFrame < 0 || timecode.startFrame >= day) {

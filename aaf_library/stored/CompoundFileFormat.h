@@ -71,6 +71,7 @@ inline constexpr std::size_t kEntrySizeOffset = 120;
 inline constexpr std::size_t kLongestName = 31;
 
 enum class EntryKind : std::uint8_t { Unused = 0, Storage = 1, Stream = 2, Root = 5 };
+inline constexpr std::uint8_t kRed = 0;
 inline constexpr std::uint8_t kBlack = 1;
 inline constexpr std::uint32_t kNoEntry = 0xFFFFFFFF;
 

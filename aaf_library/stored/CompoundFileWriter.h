@@ -2,10 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/stored/CompoundDirectory.h"
 #include "aaf_library/stored/CompoundFileFormat.h"
 #include "aaf_library/stored/StoredTree.h"
 
-#include <array>
 #include <optional>
 #include <string>
 #include <vector>
@@ -23,7 +23,8 @@ struct CompoundPart {
 // Lays a compound file out in memory. Its sectors come in this order: long
 // streams as they are added, the short streams as one and their table, the
 // directory, the allocation table, the list of its sectors.
-// The same calls give the same bytes. Throws StoredError.
+// The same calls give the same bytes. Throws StoredError, and TooLargeError as
+// soon as it is known that the file would be too large.
 class CompoundFileWriter {
 public:
     // A storage by the number of its directory entry.
@@ -47,34 +48,25 @@ public:
     std::optional<CompoundPart> FinishPart();
 
 private:
-    // A directory entry among those of its storage.
-    struct Place {
-        Storage holder = kRoot;
-        std::uint32_t index = 0;
-        std::size_t length = 0;
-        std::array<char16_t, kLongestName> name{};  // in upper case
-    };
-
-    std::uint32_t AddEntry(Storage holder, const std::u16string& name, EntryKind kind);
-    std::uint8_t* EntryAt(std::uint32_t index);
-    std::u16string NameOf(std::uint32_t index);
-    void SetContent(std::uint32_t index, std::uint32_t start, std::size_t size);
     void SetHeader(std::size_t offset, std::size_t value);
-    std::uint32_t AppendSectors(const Bytes& content);
+    std::uint64_t BytesSoFar();
+    void CheckSize(std::uint64_t size) const;
+    std::vector<std::uint32_t> TakeSectors(std::size_t count, std::uint32_t mark);
     std::uint32_t NumberSectors(std::size_t size);
+    Bytes& PieceWithRoomFor(std::size_t size);
+    std::uint32_t AppendSectors(const Bytes& content);
     std::uint32_t AppendSmallSectors(const Bytes& content);
-    void LinkSiblings();
     Bytes SmallTable();
     Bytes Table();
 
     const std::size_t sectorSize_;
+    const std::uint32_t lockSector_;
     const bool large_;
-    Bytes file_;
+    std::vector<Bytes> pieces_;         // the header, then the long streams
     std::vector<std::uint32_t> table_;  // the sector after each sector
     Bytes small_;                       // the short streams
     std::vector<std::uint32_t> smallTable_;
-    Bytes directory_;
-    std::vector<Place> places_;
+    CompoundDirectory directory_;
 };
 
 }  // namespace aaf::stored

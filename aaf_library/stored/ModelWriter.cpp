@@ -85,13 +85,13 @@ public:
 private:
     // A property as the file has it.
     struct PropertyFacts {
-        PropertyId from = kNoPropertyId;  // its number in the model of the objects
-        const PropertyDefinition* definition = nullptr;
-        StoredProperty empty;                // of the right form and name, holding nothing yet
+        PropertyId from;  // its number in the model of the objects
+        const PropertyDefinition* definition;
+        StoredProperty empty;  // of the right form and name, holding nothing yet
+        bool carriesType;
+        bool isSetOfParameters;
+        bool namesParameter;
         std::set<Bytes>* targets = nullptr;  // weak forms: what references to that set lead to
-        bool carriesType = false;
-        bool isSetOfParameters = false;
-        bool namesParameter = false;
     };
     // What all objects of a class have in common.
     struct ClassFacts {
@@ -161,17 +161,15 @@ private:
             }
         }
         const PropertyDefinition& definition = DefinitionOf(facts, from, pid);
-        PropertyFacts& made = facts.properties.emplace_back();
-        made.from = pid;
-        made.definition = &definition;
-        made.empty = EmptyProperty(definition);
+        const TypeKind kind = definition.type()->Resolved().kind();
+        PropertyFacts& made = facts.properties.emplace_back(
+            PropertyFacts{pid, &definition, EmptyProperty(definition),
+                          kind == TypeKind::Indirect || kind == TypeKind::Opaque,
+                          definition.id() == prop::OperationGroup_Parameters.id,
+                          definition.id() == prop::Parameter_Definition.id});
         if (IsWeak(made.empty.form)) {
             NameTargets(made);
         }
-        const TypeKind kind = definition.type()->Resolved().kind();
-        made.carriesType = kind == TypeKind::Indirect || kind == TypeKind::Opaque;
-        made.isSetOfParameters = definition.id() == prop::OperationGroup_Parameters.id;
-        made.namesParameter = definition.id() == prop::Parameter_Definition.id;
         return made;
     }
 

@@ -15,6 +15,12 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+// What is to be written takes more bytes than a file of that kind may have.
+class TooLargeError : public StoredError {
+public:
+    using StoredError::StoredError;
+};
+
 // Objects nested deeper than this are neither written nor read. Real files
 // stay below twenty; the limit keeps recursion harmless.
 constexpr int kMaximumDepth = 100;

@@ -136,6 +136,8 @@ FileResult SaveTree(const StoredObject& root, const std::filesystem::path& path,
                     SectorSize sectorSize) {
     try {
         return ReplaceFile(WriteTreeInPieces(root, sectorSize), path);
+    } catch (const TooLargeError& problem) {
+        return Failed(FileFailure::TooLarge, path, problem.what());
     } catch (const StoredError& problem) {
         return Failed(FileFailure::NotStorable, path, problem.what());
     } catch (const std::bad_alloc&) {

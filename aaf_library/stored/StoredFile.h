@@ -19,6 +19,7 @@ enum class FileFailure {
     NotAaf,       // the file is of another kind
     Damaged,      // an AAF file that is cut short or contradicts itself
     NotStorable,  // the content has something that the stored form cannot hold
+    TooLarge,     // the content takes more bytes than a file of that kind may have
     NoMemory,
 };
 

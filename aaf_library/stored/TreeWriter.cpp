@@ -222,6 +222,8 @@ private:
             const Storage contained = file_.AddStorage(storage, child.name);
             try {
                 Fill(contained, *child.object, depth + 1);
+            } catch (const TooLargeError&) {
+                throw;  // the file's fault, not the object's
             } catch (const StoredError& problem) {
                 throw StoredError(ToUtf8(child.name) + ": " + problem.what());
             }
@@ -420,7 +422,11 @@ std::vector<Bytes> WriteTreeInPieces(const StoredObject& root, SectorSize sector
 
 std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
                                       const std::vector<TargetPath>& paths) {
-    return TreeWriter(SectorSize::Bytes512).LayOut(object, paths);
+    try {
+        return TreeWriter(SectorSize::Bytes512).LayOut(object, paths);
+    } catch (const TooLargeError&) {
+        return nullptr;  // the file that it goes into tells
+    }
 }
 
 }  // namespace aaf::stored

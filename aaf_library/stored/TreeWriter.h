@@ -24,8 +24,8 @@ struct LaidOut {
     std::vector<TargetPath> paths;
 };
 
-// For objects that many files hold. Null when one of its streams is so long
-// that it can't be shared. Throws StoredError.
+// For objects that many files hold. Null when it can't be shared: one of its
+// streams is too long for that, or all of it too large. Throws StoredError.
 std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
                                       const std::vector<TargetPath>& paths);
 

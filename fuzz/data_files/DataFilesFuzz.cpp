@@ -2,10 +2,12 @@
 // SPDX-License-Identifier: MIT
 
 // Arbitrary bytes as either data file: read by the host's parser and the
-// module's readers, then every question is asked of every entry.
+// module's readers, then every question is asked of every entry. As both files
+// at once they are checked for mistakes.
 
 #include <cstdint>
 #include <cstdio>
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <ostream>
@@ -13,6 +15,7 @@
 
 #include "fuzz/support/RunLimits.h"
 #include "host_interfaces/util/NMAUtil.h"
+#include "reference_host/data_check/DataCheck.h"
 #include "reference_host/framework/Host.h"
 #include "reference_host/xml/RegisterXmlComponents.h"
 #include "source/descriptor_data/AAFInfoFields.h"
@@ -38,14 +41,34 @@ INCFComponentFactory* Factory() {
     return &host->factory();
 }
 
-// One file for the whole run, deleted at its end.
-const NMAString& TheFile(const std::uint8_t* data, std::size_t size) {
+// One folder for the whole run, deleted at its end.
+const TestFolder& TheFolder() {
     static const TestFolder folder;
-    static const std::filesystem::path path = folder / "data.xml";
+    return folder;
+}
+
+const NMAString& TheFile(const std::uint8_t* data, std::size_t size) {
+    static const std::filesystem::path path = TheFolder() / data_check::kDataFileNames[0];
     static const NMAString name(path.c_str());
     std::ofstream(path, std::ios::binary)
         .write(reinterpret_cast<const char*>(data), static_cast<std::streamsize>(size));
     return name;
+}
+
+void CheckAsBoth() {
+    static const bool isLinked = [] {
+        std::filesystem::create_symlink(TheFolder() / data_check::kDataFileNames[0],
+                                        TheFolder() / data_check::kDataFileNames[1]);
+        return true;
+    }();
+    const data_check::CheckedData checked = data_check::CheckData(TheFolder().path());
+    // Each finding stands somewhere, and says what helps.
+    for (const data_check::Finding& finding : checked.findings) {
+        if (!isLinked || finding.place.line < 1 || finding.place.column < 1 ||
+            finding.what.empty() || finding.hint.empty()) {
+            std::abort();
+        }
+    }
 }
 
 void AskAll(const GenericXMLDataContainer& infos, ncfUInt32 id, ncfUInt32 width) {
@@ -106,5 +129,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
             // a file that can't be read
         }
     }
+    CheckAsBoth();
     return 0;
 }

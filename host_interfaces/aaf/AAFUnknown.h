@@ -3,6 +3,7 @@
 #pragma once
 
 #include "host_interfaces/aaf/AAFPlainTypes.h"
+#include "host_interfaces/framework/Compiler.h"
 
 // The published AAF interfaces: names, ids, operations and their order are those of
 // the published library, because any build of it may stand behind them. What holds
@@ -31,8 +32,24 @@
 //   Arguments    Have the published names; units are those of the AAF object model:
 //                lengths and positions in edit units, rates as fractions a second.
 //
+// The usual id of the root of them all, which the published library answers on Windows
+// only, and the one of all zero bytes that it answers elsewhere.
+inline constexpr GUID IID_IUnknown_COM = ncfGuid("00000000-0000-0000-C000-000000000046");
+inline constexpr GUID IID_IUnknown_Zero = ncfGuid("00000000-0000-0000-0000-000000000000");
+
+// Windows' own headers have the same interface by the same name. Whichever comes first
+// declares it, and the other takes what is there.
+#ifndef __IUnknown_INTERFACE_DEFINED__
+#ifdef _WIN32
+#define __IUnknown_INTERFACE_DEFINED__
+using LPUNKNOWN = struct IUnknown*;
+inline constexpr GUID IID_IUnknown = IID_IUnknown_COM;
+#else
+inline constexpr GUID IID_IUnknown = IID_IUnknown_Zero;
+#endif
+
 // Root of them all: finds an object's other interfaces and counts who holds it.
-struct IUnknown {
+struct NCF_UUID("00000000-0000-0000-C000-000000000046") IUnknown {
     virtual HRESULT QueryInterface(REFIID iid, void** out) = 0;
     virtual ULONG AddRef() = 0;
     virtual ULONG Release() = 0;
@@ -40,19 +57,18 @@ struct IUnknown {
 protected:
     ~IUnknown() = default;
 };
-
-// The usual id, which the published library answers on Windows only, and the
-// one of all zero bytes that it answers elsewhere.
-inline constexpr GUID IID_IUnknown_COM = ncfGuid("00000000-0000-0000-C000-000000000046");
-inline constexpr GUID IID_IUnknown_Zero = ncfGuid("00000000-0000-0000-0000-000000000000");
-#ifdef _WIN32
-inline constexpr GUID IID_IUnknown = IID_IUnknown_COM;
-#else
-inline constexpr GUID IID_IUnknown = IID_IUnknown_Zero;
 #endif
+
 constexpr const GUID& aafIdOf(const IUnknown*) {
-    return IID_IUnknown;
+#ifdef _WIN32
+    return IID_IUnknown_COM;
+#else
+    return IID_IUnknown_Zero;
+#endif
 }
 
-// Used by DllGetClassObject only.
-inline constexpr GUID IID_IClassFactory = ncfGuid("00000001-0000-0000-C000-000000000046");
+// Used by DllGetClassObject only. Windows' headers have it without the ending.
+inline constexpr GUID IID_IClassFactory_COM = ncfGuid("00000001-0000-0000-C000-000000000046");
+#ifndef _WIN32
+inline constexpr GUID IID_IClassFactory = IID_IClassFactory_COM;
+#endif

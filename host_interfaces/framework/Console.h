@@ -2,16 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/framework/Compiler.h"
 #include "host_interfaces/framework/Unknown.h"
-
-#if defined(__MINGW32__)
-// Every part of the system is built with the ANSI formatter.
-#define NCF_PRINTF(text, first) __attribute__((format(gnu_printf, text, first)))
-#elif defined(__GNUC__)
-#define NCF_PRINTF(text, first) __attribute__((format(printf, text, first)))
-#else
-#define NCF_PRINTF(text, first)
-#endif
 
 // The user's console: lines of text with a level. Levels in use: 1 failures shown
 // to the user, 2 notices, 4 details.

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/framework/Compiler.h"
 #include "host_interfaces/framework/ComponentFactory.h"
 #include "host_interfaces/framework/Definitions.h"
 
@@ -69,11 +70,7 @@
 // A null `host` or output gives NCF_E_POINTER in the first two functions and
 // NCF_E_INVALIDARG in the next two. NCFStartup and NCFShutdown are not counted: each
 // may come twice.
-#ifdef _WIN32
-#define NCF_PLUGIN_EXPORT extern "C" __declspec(dllexport)
-#else
-#define NCF_PLUGIN_EXPORT extern "C" __attribute__((visibility("default")))
-#endif
+#define NCF_PLUGIN_EXPORT extern "C" NCF_EXPORT
 
 // The types of the six functions. `host` is the host unknown, borrowed for the call.
 using NCFRegisterPluginFunction = NCFRESULT (*)(INCFUnknown* host,

@@ -2,13 +2,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "host_interfaces/framework/Compiler.h"
+
 // Marks what the utility library exports and the module imports.
-#ifdef _WIN32
 #ifdef NMAUTIL_BUILDING
-#define NMAUTIL_API __declspec(dllexport)
+#define NMAUTIL_API NCF_EXPORT
 #else
-#define NMAUTIL_API __declspec(dllimport)
-#endif
-#else
-#define NMAUTIL_API __attribute__((visibility("default")))
+#define NMAUTIL_API NCF_IMPORT
 #endif

@@ -145,6 +145,29 @@ std::optional<Catalog::Known> Catalog::Find(std::string_view path) {
     return known;
 }
 
+std::optional<Entry> Catalog::Read(std::string_view path) {
+    Statement find = database_->Prepare("SELECT id FROM movies WHERE path = ?");
+    find.Bind(1, path);
+    if (!find.Step()) {
+        return std::nullopt;
+    }
+    Entry entry;
+    for (std::size_t t = 0; t < kTableCount; ++t) {
+        std::vector<Row>& rows = entry[kTables[t].name];
+        Statement& select = statements().tables[t].select;
+        select.Bind(1, find.Integer(0));
+        while (select.Step()) {
+            Row& row = rows.emplace_back();
+            for (int column = 0; column < select.Columns(); ++column) {
+                if (!select.IsNull(column)) {
+                    row[select.NameOf(column)] = select.Text(column);
+                }
+            }
+        }
+    }
+    return entry;
+}
+
 std::vector<std::string> Catalog::PathsThatBegin(const std::string& text) {
     Statement select =
         database_->Prepare("SELECT path FROM movies WHERE path >= ?1 AND path < ?2 ORDER BY path");

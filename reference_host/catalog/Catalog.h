@@ -42,6 +42,8 @@ public:
         bool hasFailed = false;
     };
     std::optional<Known> Find(std::string_view path);
+    // All that is known of a movie.
+    std::optional<Entry> Read(std::string_view path);
     // The paths that begin so, in their order.
     std::vector<std::string> PathsThatBegin(const std::string& text);
 

@@ -266,6 +266,15 @@ private:
 
 }  // namespace
 
+std::string KindOfDataNamed(const std::string& id) {
+    for (const KindOfData& kind : kKinds) {
+        if (ToText(kind.id) == id) {
+            return kind.name;
+        }
+    }
+    return {};
+}
+
 SlotData DataOfSlot(IAAFMobSlot& slot) {
     SlotData found;
     host::Ref<IAAFDataDef> data;

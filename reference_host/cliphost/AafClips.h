@@ -39,6 +39,8 @@ struct SlotData {
     std::string kind;
 };
 SlotData DataOfSlot(IAAFMobSlot& slot);
+// That name, of a data definition whose id is written so; empty where it has none.
+std::string KindOfDataNamed(const std::string& id);
 
 // In the order of their names; a file keeps its mobs in that of their ids.
 std::vector<AafClip> ClipsOf(IAAFFile* file);

@@ -21,9 +21,11 @@ namespace {
 constexpr int kDeepest = 32;  // objects inside objects
 constexpr std::string_view kClassOfObject = "ObjClass";
 
+}  // namespace
+
 // The names of definitions, each asked for once.
 template <class Definition>
-class Names {
+class NamesOfDefinitions {
 public:
     const std::string& Of(const host::Ref<Definition>& definition) {
         Named& named = names_[definition.get()];
@@ -43,8 +45,10 @@ private:
     std::unordered_map<Definition*, Named> names_{64};
 };
 
-class TreeReader {
+class ObjectReader::TreeReader {
 public:
+    explicit TreeReader(LongValues longValues) : values_(longValues) {}
+
     void Read(IAAFObject* object, int depth, TreeNode& node);
 
 private:
@@ -58,13 +62,13 @@ private:
     void ReadProperty(const Property& property, int depth, TreeNode& node);
 
     ValueReader values_;
-    Names<IAAFClassDef> classes_;
-    Names<IAAFPropertyDef> properties_;
+    NamesOfDefinitions<IAAFClassDef> classes_;
+    NamesOfDefinitions<IAAFPropertyDef> properties_;
     // Of the object that is being read, behind those of the objects that it is part of.
     std::vector<Property> open_;
 };
 
-void TreeReader::OpenProperties(IAAFObject* object) {
+void ObjectReader::TreeReader::OpenProperties(IAAFObject* object) {
     host::Ref<IEnumAAFProperties> properties;
     if (object->GetProperties(properties.Out()) < 0) {
         return;
@@ -85,12 +89,13 @@ void TreeReader::OpenProperties(IAAFObject* object) {
     }
 }
 
-void TreeReader::Read(IAAFObject* object, int depth, TreeNode& node) {
+void ObjectReader::TreeReader::Read(IAAFObject* object, int depth, TreeNode& node) {
     host::Ref<IAAFClassDef> definition;
     if (object->GetDefinition(definition.Out()) >= 0) {
         node.title = classes_.Of(definition);
     }
     if (depth > kDeepest) {
+        node.isCut = true;
         return;
     }
     const std::size_t first = open_.size();
@@ -103,7 +108,7 @@ void TreeReader::Read(IAAFObject* object, int depth, TreeNode& node) {
     open_.resize(first);
 }
 
-void TreeReader::ReadProperty(const Property& property, int depth, TreeNode& node) {
+void ObjectReader::TreeReader::ReadProperty(const Property& property, int depth, TreeNode& node) {
     const bool isClass = *property.name == kClassOfObject;  // the title says it
     if (isClass && depth > 0) {
         return;
@@ -112,11 +117,30 @@ void TreeReader::ReadProperty(const Property& property, int depth, TreeNode& nod
     std::vector<TreeNode> parts;
     const auto read = [&](IAAFObject* part) { Read(part, depth + 1, parts.emplace_back()); };
     if (type.TakeObjects(property.value.get(), std::ref(read))) {
-        node.branches.push_back({*property.name, std::move(parts)});
+        node.branches.push_back({*property.name, std::move(parts), type.IsSet()});
     } else if (!isClass) {
         node.facts.push_back({*property.name, type.Text(property.value.get())});
     }
 }
+
+ObjectReader::ObjectReader(LongValues longValues)
+    : reader_(std::make_unique<TreeReader>(longValues)) {}
+ObjectReader::~ObjectReader() = default;
+
+TreeNode ObjectReader::Read(IAAFObject* object) {
+    TreeNode node;
+    reader_->Read(object, 0, node);
+    return node;
+}
+
+TreeNode ObjectReader::ReadAlone(IAAFObject* object) {
+    TreeNode node;
+    reader_->Read(object, kDeepest, node);
+    node.branches.clear();
+    return node;
+}
+
+namespace {
 
 // Master, file, source: told by the byte in which their ids differ.
 int PlaceOf(IAAFMob* mob) {
@@ -127,16 +151,14 @@ int PlaceOf(IAAFMob* mob) {
 
 }  // namespace
 
-TreeNode ReadTree(IAAFFile* file) {
-    TreeNode root;
-    root.title = "AAF file";
+std::vector<host::Ref<IAAFMob>> MobsOf(IAAFFile* file) {
+    std::vector<host::Ref<IAAFMob>> mobs;
     host::Ref<IAAFHeader> header;
     host::Ref<IEnumAAFMobs> enumerator;
     if (!file || file->GetHeader(header.Out()) < 0 ||
         header->GetMobs(nullptr, enumerator.Out()) < 0) {
-        return root;
+        return mobs;
     }
-    std::vector<host::Ref<IAAFMob>> mobs;
     host::Ref<IAAFMob> mob;
     while (enumerator->NextOne(mob.Out()) >= 0) {
         mobs.push_back(mob);
@@ -144,11 +166,17 @@ TreeNode ReadTree(IAAFFile* file) {
     std::stable_sort(mobs.begin(), mobs.end(), [](const auto& a, const auto& b) {
         return PlaceOf(a.get()) < PlaceOf(b.get());
     });
+    return mobs;
+}
+
+TreeNode ReadTree(IAAFFile* file) {
+    TreeNode root;
+    root.title = "AAF file";
     TreeNode::Branch branch{"Mobs", {}};
-    TreeReader reader;
-    for (const auto& each : mobs) {
+    ObjectReader reader;
+    for (const auto& each : MobsOf(file)) {
         if (const auto object = As<IAAFObject>(each.get())) {
-            reader.Read(object.get(), 0, branch.nodes.emplace_back());
+            branch.nodes.push_back(reader.Read(object.get()));
         }
     }
     root.branches.push_back(std::move(branch));

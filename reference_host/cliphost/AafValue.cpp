@@ -14,14 +14,32 @@
 #include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "host_interfaces/aaf/AAFTypeDefinitionsOfMany.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
+#include "reference_host/cliphost/Digest.h"
 #include "text/Encodings.h"
 
 namespace cliphost {
 
 namespace {
 
-constexpr char kUnreadable[] = "?";
-constexpr aafUInt32 kMostElements = 64;  // of an array shown on one line
+constexpr aafUInt32 kMostElements = 64;         // of an array shown on one line
+constexpr std::size_t kMostOfStream = 0x10000;  // that is read at once
+constexpr std::size_t kMostOfRest = 0x10000;    // that is kept before it is digested
+
+// A digest of texts that come one after the other.
+class Rest {
+public:
+    void Add(std::string_view text) {
+        bytes_ += text;
+        bytes_ += '\0';
+        if (bytes_.size() > kMostOfRest) {
+            bytes_ = TextOf(DigestOf(bytes_));
+        }
+    }
+    std::string Text() const { return TextOf(DigestOf(bytes_)); }
+
+private:
+    std::string bytes_;
+};
 
 // A type behind one of its own interfaces. The type lives as long.
 template <class Interface>
@@ -254,13 +272,33 @@ private:
 
 // --- several in one --------------------------------------------------------------------------
 
-std::string ElementsText(aafUInt32 count, const std::vector<std::string>& elements) {
-    std::string text = "[";
-    for (const std::string& element : elements) {
-        text += (text.size() > 1 ? ", " : "") + element;
+// The elements of a value on one line, as they come.
+class ElementsText {
+public:
+    explicit ElementsText(const ValueReader& reader) : digestsRest_(reader.DigestsLongValues()) {}
+
+    bool TakesMore() const { return count_ < kMostElements || digestsRest_; }
+    void Add(const std::string& element) {
+        if (count_++ < kMostElements) {
+            text_ += (text_.size() > 1 ? ", " : "") + element;
+        } else {
+            rest_.Add(element);
+        }
     }
-    return text + (count <= kMostElements ? "]" : fmt::format(", ... {} in all]", count));
-}
+    std::string Text(aafUInt32 count) const {
+        if (count <= kMostElements) {
+            return text_ + "]";
+        }
+        return text_ + fmt::format(", ... {} in all{}]", count,
+                                   digestsRest_ ? ", the rest has digest " + rest_.Text() : "");
+    }
+
+private:
+    bool digestsRest_;
+    aafUInt32 count_ = 0;
+    std::string text_ = "[";
+    Rest rest_;
+};
 
 template <class ArrayInterface>
 class ArrayType : public TypeAs<ArrayInterface> {
@@ -269,14 +307,14 @@ public:
 
 protected:
     std::string ArrayText(aafUInt32 count, IAAFPropertyValue* value) {
-        std::vector<std::string> elements;
-        for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
+        ElementsText elements(this->reader());
+        for (aafUInt32 i = 0; i < count && elements.TakesMore(); ++i) {
             host::Ref<IAAFPropertyValue> element;
-            elements.push_back(this->as()->GetElementValue(value, i, element.Out()) >= 0
-                                   ? this->TextOfOther(element.get())
-                                   : kUnreadable);
+            elements.Add(this->as()->GetElementValue(value, i, element.Out()) >= 0
+                             ? this->TextOfOther(element.get())
+                             : kUnreadable);
         }
-        return ElementsText(count, elements);
+        return elements.Text(count);
     }
 };
 
@@ -333,12 +371,12 @@ public:
         if (as()->GetCount(value, &count) < 0 || as()->GetElements(value, enumerator.Out()) < 0) {
             return kUnreadable;
         }
-        std::vector<std::string> elements;
+        ElementsText elements(reader());
         host::Ref<IAAFPropertyValue> element;
-        while (elements.size() < kMostElements && enumerator->NextOne(element.Out()) >= 0) {
-            elements.push_back(TextOfOther(element.get()));
+        while (elements.TakesMore() && enumerator->NextOne(element.Out()) >= 0) {
+            elements.Add(TextOfOther(element.get()));
         }
-        return ElementsText(count, elements);
+        return elements.Text(count);
     }
     bool TakeObjects(IAAFPropertyValue* value,
                      const std::function<void(IAAFObject*)>& take) override {
@@ -352,6 +390,8 @@ public:
         }
         return true;
     }
+
+    bool IsSet() const override { return true; }
 
 private:
     bool ownsObjects_ = false;
@@ -395,6 +435,38 @@ public:
     }
 };
 
+// --- bytes of any length ---------------------------------------------------------------------
+
+class StreamType final : public TypeAs<IAAFTypeDefStream> {
+public:
+    using TypeAs::TypeAs;
+    std::string TextOfValue(IAAFPropertyValue* value) override {
+        aafInt64 size = 0;
+        if (as()->GetSize(value, &size) < 0) {
+            return kUnreadable;
+        }
+        const std::string text = fmt::format("{} bytes", size);
+        return reader().DigestsLongValues() ? WithDigest(value, size, text) : text;
+    }
+
+private:
+    std::string WithDigest(IAAFPropertyValue* value, aafInt64 left, const std::string& text) {
+        std::vector<aafUInt8> bytes(kMostOfStream);
+        Rest rest;
+        as()->SetPosition(value, 0);
+        while (left > 0) {
+            aafUInt32 read = 0;
+            if (as()->Read(value, kMostOfStream, bytes.data(), &read) < 0 || read == 0 ||
+                read > kMostOfStream) {
+                return kUnreadable;
+            }
+            rest.Add({reinterpret_cast<const char*>(bytes.data()), read});
+            left -= read;
+        }
+        return text + ", digest " + rest.Text();
+    }
+};
+
 template <class Type>
 std::unique_ptr<ValueType> MakeType(ValueReader& reader, const host::Ref<IAAFTypeDef>& type) {
     return std::make_unique<Type>(reader, type);
@@ -417,6 +489,7 @@ constexpr TypeRow kTypes[] = {
     {kAAFTypeCatSet, MakeType<SetType>},
     {kAAFTypeCatIndirect, MakeType<IndirectType>},
     {kAAFTypeCatRename, MakeType<RenamedType>},
+    {kAAFTypeCatStream, MakeType<StreamType>},
 };
 
 std::unique_ptr<ValueType> MakeType(ValueReader& reader, const host::Ref<IAAFTypeDef>& type) {
@@ -539,6 +612,8 @@ bool IsRaw(IAAFPropertyValue* value) {
 
 class RawType final : public ValueType {
 public:
+    explicit RawType(const ValueReader& reader) : digestsRest_(reader.DigestsLongValues()) {}
+
     std::string Text(IAAFPropertyValue* value) override {
         host::Ref<IAAFTypeDef> type;
         value->GetType(type.Out());
@@ -555,19 +630,30 @@ public:
         for (aafUInt32 i = 0; i < count && i < kMostElements; ++i) {
             text += fmt::format(" {:02x}", bytes[i]);
         }
-        return count <= kMostElements ? text : text + fmt::format(" ... {} in all", count);
+        if (count <= kMostElements) {
+            return text;
+        }
+        text += fmt::format(" ... {} in all", count);
+        return digestsRest_ ? text + ", digest " + DigestText(bytes) : text;
     }
+
+private:
+    static std::string DigestText(const std::vector<aafUInt8>& bytes) {
+        return TextOf(DigestOf({reinterpret_cast<const char*>(bytes.data()), bytes.size()}));
+    }
+
+    bool digestsRest_;
 };
 
 }  // namespace
 
-ValueReader::ValueReader() = default;
+ValueReader::ValueReader(LongValues longValues) : longValues_(longValues) {}
 ValueReader::~ValueReader() = default;
 
 ValueType& ValueReader::TypeOf(IAAFPropertyValue* value) {
     if (IsRaw(value)) {
         if (!raw_) {
-            raw_ = std::make_unique<RawType>();
+            raw_ = std::make_unique<RawType>(*this);
         }
         return *raw_;
     }

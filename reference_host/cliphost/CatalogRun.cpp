@@ -76,6 +76,7 @@ MovieAnswer CatalogAnswer(Session& session, CodecReader& codecs, const CatalogFo
         return answer;
     }
     TellRoute(description.movie, session.verbosity());
+    WriteColumns(session, description, form.columns);
     catalog::Entry entry = EntryOf(description, codecs);
     if (form.thumbnails) {
         TakeThumbnail(session, description.movie, entry);
@@ -88,7 +89,8 @@ CatalogRun::CatalogRun(Session& session, const CatalogOptions& options)
     : MoviesRun(session, options.movies, "cataloguing", ".sqlite"),
       options_(options),
       settings_(SettingsText(session, options.movies.workers.arguments)),
-      codecs_(session) {
+      codecs_(session),
+      rows_(options.form.columns) {
     const std::filesystem::path& file = options.movies.together;
     std::error_code ignored;
     if (options.update && std::filesystem::exists(file, ignored)) {
@@ -108,10 +110,7 @@ Catalog& CatalogRun::catalog() {
 }
 
 MovieAnswer CatalogRun::Answer(const MovieStep& step, const PlaceOfFile&) {
-    const Description description =
-        step.folder ? DescribeFromList(session(), step.folder->list(), step.index, step.movie)
-                    : DescribeMovie(session(), step.movie);
-    return CatalogAnswer(session(), codecs_, options_.form, description);
+    return CatalogAnswer(session(), codecs_, options_.form, DescriptionOf(step));
 }
 
 bool CatalogRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
@@ -171,7 +170,9 @@ void CatalogRun::Add(const std::filesystem::path& movie, catalog::Entry entry, b
 
 // What goes wrong here ends the run: no further movie would fare better.
 void CatalogRun::Write() {
-    catalog().Put(waiting_);
+    if (!waiting_.empty()) {
+        catalog().Put(waiting_);
+    }
     waiting_.clear();
     written_ = std::chrono::steady_clock::now();
 }
@@ -202,11 +203,36 @@ std::size_t CatalogRun::RemoveGone() {
     return gone.size();
 }
 
+// One that is there stays where this one has only a part of the movies, or none: a disk may be
+// away.
+void CatalogRun::PutIntoPlace() {
+    if (made_->TakesPlace() && IsStopped()) {
+        return;
+    }
+    if (made_->TakesPlace() && catalog().Count() == 0) {
+        const Failure kept(kExitFile, options_.movies.together,
+                           "no movie was found; the catalog is left as it was");
+        TellAlso(kept);
+        if (options_.lines) {
+            PrintFailureLine(schema::kCatalogLine, {}, kept.problem());
+        }
+        return;
+    }
+    made_->Finish();
+}
+
+void CatalogRun::Planned(const MoviePlan& plan) {
+    rows_.Find(plan, [](std::size_t, std::size_t, const Failure& why) { throw why; });
+}
+
 void CatalogRun::Finish(int read, int failed) {
     Write();
     const std::size_t gone = updated_ && !IsStopped() ? RemoveGone() : 0;
-    if (made_ && !(IsStopped() && made_->TakesPlace())) {
-        made_->Finish();
+    if (made_) {
+        PutIntoPlace();
+    }
+    if (options_.movies.shard.IsWhole()) {
+        rows_.TellUnused();
     }
     if (options_.lines) {
         return;

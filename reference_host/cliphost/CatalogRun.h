@@ -12,12 +12,14 @@
 #include "reference_host/cliphost/MovieCodecs.h"
 #include "reference_host/cliphost/MovieEntry.h"
 #include "reference_host/cliphost/MoviesRun.h"
+#include "reference_host/cliphost/RowsOfMovies.h"
 
 namespace cliphost {
 
 // How the movies of a catalog are read.
 struct CatalogForm {
     bool thumbnails = false;
+    GivenColumns columns;  // to be written into the descriptions before they are read
 };
 
 struct CatalogOptions {
@@ -50,16 +52,19 @@ private:
     bool IsDoneAlready(std::size_t place, const MovieStep& step,
                        const host::system::FileState& state) override;
     const char* HowToGoOn() const override;
+    void Planned(const MoviePlan& plan) override;
     void Finish(int read, int failed) override;
 
     catalog::Catalog& catalog();
     void Add(const std::filesystem::path& movie, catalog::Entry entry, bool hasFailed);
     void Write();
     std::size_t RemoveGone();
+    void PutIntoPlace();
 
     const CatalogOptions& options_;
     const std::string settings_;
     CodecReader codecs_;
+    RowsOfMovies rows_;
     std::optional<NewCatalog> made_;
     std::optional<catalog::Catalog> updated_;
     std::vector<catalog::Entry> waiting_;

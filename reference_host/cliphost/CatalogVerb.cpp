@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 
 #include "reference_host/cliphost/CatalogRun.h"
+#include "reference_host/cliphost/ColumnsOption.h"
 #include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/Verbs.h"
@@ -15,6 +16,7 @@ namespace {
 void AddForm(CLI::App& verb, CatalogForm& form) {
     verb.add_flag("--thumbnails", form.thumbnails,
                   "Keep a small picture of each movie, as PNG, from its middle");
+    AddColumnsOption(verb, form.columns);
 }
 
 void AddCatalogForParent(CLI::App& app, const SessionOptions& session, int& status) {
@@ -23,6 +25,7 @@ void AddCatalogForParent(CLI::App& app, const SessionOptions& session, int& stat
     CLI::App* const verb = AddWorkerVerb(app, worker);
     AddForm(*verb, *form);
     verb->callback([&session, &status, worker, form] {
+        form->columns.Read();
         Session running(session);
         CodecReader codecs(running);
         ServeMovies(running, *worker, [&](const std::filesystem::path& movie, const PlaceOfFile&) {
@@ -42,6 +45,7 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost catalog FOLDER -o clips.sqlite\n"
         "  cliphost catalog FOLDER -o clips.sqlite --recursive --extensions mov,mxf --update\n"
         "  cliphost catalog FOLDER -o clips.sqlite --thumbnails\n"
+        "  cliphost catalog FOLDER -o clips.sqlite --columns LIST.csv   # with reels from a table\n"
         "  cliphost catalog --files-from LIST -o part2.sqlite --shard 2/16 --update\n"
         "  cliphost catalog --files-from LIST -o clips.sqlite --jsonl\n"
         "  cliphost catalog --merge part1.sqlite part2.sqlite -o clips.sqlite\n\n"
@@ -64,8 +68,8 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
     AddWorkerOptions(*verb, options->movies.workers);
     // It reads no movie.
     for (const char* const other :
-         {"--thumbnails", "--jsonl", "--files-from", "--recursive", "--extensions", "--shard",
-          "--jobs", "--limit-seconds", "--limit-memory"}) {
+         {"--thumbnails", "--columns", "--jsonl", "--files-from", "--recursive", "--extensions",
+          "--shard", "--jobs", "--limit-seconds", "--limit-memory"}) {
         merge->excludes(other);
     }
     AddCatalogForParent(app, session, status);
@@ -77,6 +81,7 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
             return;
         }
         AnswerFailureInLine(options->lines, schema::kCatalogLine, [&] {
+            options->form.columns.Read();
             TakeWorkerVerb(app, *verb, "catalog-for-parent", session, options->movies.workers);
             Session running(session);
             status = WithCatalog(options->movies.together,

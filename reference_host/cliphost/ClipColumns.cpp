@@ -146,17 +146,25 @@ std::vector<Comment> CommentsOf(IAAFMob& mob) {
     return comments;
 }
 
-// As a bin shows it: the values of one name together.
 ColumnValues ValuesOf(const std::vector<Comment>& comments) {
     ColumnValues values;
     for (const Comment& comment : comments) {
+        values.emplace_back(comment.name, comment.text);
+    }
+    return values;
+}
+
+// As a bin shows it: the values of one name together.
+ColumnValues Joined(const ColumnValues& columns) {
+    ColumnValues values;
+    for (const auto& column : columns) {
         const auto known = std::find_if(values.begin(), values.end(), [&](const auto& value) {
-            return InSmallLetters(value.first) == InSmallLetters(comment.name);
+            return InSmallLetters(value.first) == InSmallLetters(column.first);
         });
         if (known == values.end()) {
-            values.emplace_back(comment.name, comment.text);
+            values.push_back(column);
         } else {
-            known->second += kBetweenValues + comment.text;
+            known->second += kBetweenValues + column.second;
         }
     }
     return values;
@@ -211,7 +219,7 @@ private:
         std::string name = columns_.NameOf(*value_);
         const std::string small = InSmallLetters(name);
         const std::vector<Comment> comments = CommentsOf(*mobs_.master);
-        for (const auto& [known, text] : ValuesOf(comments)) {
+        for (const auto& [known, text] : Joined(ValuesOf(comments))) {
             if (InSmallLetters(known) == small) {
                 if (text == value_->text) {
                     return;
@@ -351,9 +359,12 @@ private:
     const MovieColumns::Value* value_ = nullptr;
 };
 
-std::string StartOf(const Mobs& mobs) {
+void ReadStart(const Mobs& mobs, ClipTexts& texts) {
     const auto timecode = mobs.Timecode();
     aafTimecode_t counted{};
+    if (!timecode || timecode->GetTimecode(&counted) < 0) {
+        return;
+    }
     aafSourceRef_t source{};
     ForEachSlot(mobs.file.get(), [&](IAAFMobSlot&, IAAFSegment* segment) {
         const auto clip = As<IAAFSourceClip>(segment);
@@ -362,11 +373,13 @@ std::string StartOf(const Mobs& mobs) {
             source.startTime = std::max(source.startTime, one.startTime);
         }
     });
+    texts.start = TimecodeText(source.startTime, counted.fps, counted.drop == kAAFTcDrop);
     // Two timecodes that begin with 0 are those of a movie without one of its own.
-    const bool isMadeUp = source.startTime == 0 && mobs.CountTimecodes() > 1;
-    return timecode && timecode->GetTimecode(&counted) >= 0 && !isMadeUp
-               ? TimecodeText(source.startTime, counted.fps, counted.drop == kAAFTcDrop)
-               : std::string();
+    texts.hasOwnStart = source.startTime != 0 || mobs.CountTimecodes() <= 1;
+}
+
+std::string NameOfMob(IAAFMob* mob) {
+    return mob ? TextOf(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName) : std::string();
 }
 
 std::string RateOf(const aafRational_t& rate) {
@@ -379,15 +392,20 @@ void SetColumns(IAAFFile* description, const MovieColumns& columns, const MovieC
     Writer(description, columns, row).Write();
 }
 
-ColumnValues ColumnsOf(IAAFFile* description, const std::string& codec) {
+ClipTexts TextsOf(IAAFFile* description) {
     const Mobs mobs(description);
-    ColumnValues values;
-    if (!mobs.master) {
-        return values;
+    ClipTexts texts;
+    texts.name = NameOfMob(mobs.master.get());
+    texts.reel = NameOfMob(mobs.tape.get());
+    ReadStart(mobs, texts);
+    if (mobs.master) {
+        texts.binColumns = ValuesOf(CommentsOf(*mobs.master));
     }
-    const auto nameOf = [](IAAFMob* mob) {
-        return mob ? TextOf(mob, &IAAFMob::GetNameBufLen, &IAAFMob::GetName) : std::string();
-    };
+    return texts;
+}
+
+ColumnValues ColumnsOf(IAAFFile* description, const std::string& codec) {
+    const ClipTexts texts = TextsOf(description);
     const std::vector<AafClip> clips = ClipsOf(description);
     const std::vector<SlotFacts> slots = clips.empty() ? std::vector<SlotFacts>() : clips[0].slots;
     std::size_t pictures = 0;
@@ -396,16 +414,15 @@ ColumnValues ColumnsOf(IAAFFile* description, const std::string& codec) {
         pictures += slot.kind == "picture" ? 1 : 0;
         sounds += slot.kind == "sound" ? 1 : 0;
     }
-    const ColumnValues comments = ValuesOf(CommentsOf(*mobs.master));
-    values = {
-        {"name", nameOf(mobs.master.get())},
-        {"reel", nameOf(mobs.tape.get())},
-        {"start timecode", StartOf(mobs)},
+    ColumnValues values = {
+        {"name", texts.name},
+        {"reel", texts.reel},
+        {"start timecode", texts.hasOwnStart ? texts.start : ""},
         {"length", slots.empty() ? "" : std::to_string(slots[0].length)},
         {"rate", slots.empty() ? "" : RateOf(slots[0].rate)},
         {"tracks", fmt::format("{}, {}", Counted(pictures, "picture"), Counted(sounds, "sound"))},
         {"codec", codec}};
-    for (const auto& [name, value] : comments) {
+    for (const auto& [name, value] : Joined(texts.binColumns)) {
         if (!name.empty() && name[0] != '_' && UseOf(name) == ColumnUse::Comment) {
             values.emplace_back(name, value);
         }

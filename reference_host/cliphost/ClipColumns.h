@@ -19,6 +19,16 @@ void SetColumns(IAAFFile* description, const MovieColumns& columns, const MovieC
 // Names of columns with their values.
 using ColumnValues = std::vector<std::pair<std::string, std::string>>;
 
+// What people see of a clip.
+struct ClipTexts {
+    std::string name;
+    std::string reel;          // of the tape that its source comes from
+    std::string start;         // the first timecode
+    bool hasOwnStart = false;  // it was not made up for a movie without timecode
+    ColumnValues binColumns;   // several may have one name
+};
+ClipTexts TextsOf(IAAFFile* description);
+
 // What a description tells of its movie: the fixed columns but the path, then those of the bin.
 // `codec`: that column's value.
 ColumnValues ColumnsOf(IAAFFile* description, const std::string& codec);

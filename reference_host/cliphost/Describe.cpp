@@ -18,7 +18,7 @@ void Finish(Session& session, Description& description) {
         description.file.Reset();
         description.problem = ProblemWith(session, description.movie, description.result);
     } else {
-        session.TakeNotices();
+        description.notices = session.TakeNotices();
         if (host::TellsLargePictures(description.movie)) {
             description.doubt = WrongRaster(description.movie);
         }

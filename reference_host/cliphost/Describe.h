@@ -4,6 +4,7 @@
 
 #include <filesystem>
 #include <string>
+#include <vector>
 
 #include "host_interfaces/media/MediaContainer.h"
 #include "reference_host/cliphost/Problem.h"
@@ -16,8 +17,9 @@ struct Description {
     std::filesystem::path movie;
     host::Ref<IAAFFile> file;  // empty on failure
     NCFRESULT result = NCF_OK;
-    Problem problem;  // names the movie
-    Problem doubt;    // what the header tells wrong; it is described all the same
+    Problem problem;                   // names the movie
+    Problem doubt;                     // what the header tells wrong; it is described all the same
+    std::vector<std::string> notices;  // that the module wrote for the user, where it succeeded
 };
 
 // Opens a movie through the module's container and lets it be described.

@@ -4,16 +4,14 @@
 
 #include <fmt/format.h>
 
-#include <algorithm>
-#include <map>
 #include <nlohmann/json.hpp>
 
+#include "reference_host/cliphost/ComparisonReport.h"
 #include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
-#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
 #include "reference_host/cliphost/Words.h"
@@ -31,18 +29,10 @@ constexpr char kEndingOfOutputs[] = ".aaf";
 
 // An entry of a list in JSON. `description` is JSON already.
 std::string EntryText(const ordered_json& head, const std::string& description) {
-    const std::string lines = head.dump(2, ' ', false, ordered_json::error_handler_t::replace);
-    std::string text = "  ";
-    text.reserve(lines.size() + description.size() + kRoomForEnds);
-    for (std::size_t at = 0, end = 0; at < lines.size(); at = end) {
-        end = std::min(lines.find('\n', at), lines.size() - 1) + 1;
-        text.append(lines, at, end - at);
-        if (lines[end - 1] == '\n') {
-            text += "  ";
-        }
-    }
+    std::string text = InLines(head, 2);
     if (!description.empty()) {
         constexpr std::string_view kEnd = "\n  }";
+        text.reserve(text.size() + description.size() + kRoomForEnds);
         text.resize(text.size() - kEnd.size());
         text += ",\n    \"description\": ";
         text += description;
@@ -84,9 +74,15 @@ void RefuseOutputOnto(const std::filesystem::path& output, const std::vector<Cal
 DescribeRun::DescribeRun(Session& session, const DescribeOptions& options)
     : MoviesRun(session, options.movies, "describing", kEndingOfOutputs),
       options_(options),
-      maps_(options.form.maps) {
+      maps_(options.form.maps),
+      rows_(options.form.columns) {
     if (!options.movies.together.empty()) {
         session.aaf().TryToSave(options.movies.together);
+    }
+    if (!options.against.empty()) {
+        against_ = session.aaf().Open(options.against);
+    }
+    if (!options.movies.together.empty() || against_) {
         bin_.emplace(session.aaf());
     }
 }
@@ -95,8 +91,9 @@ void DescribeRun::RefuseOutputsOntoOthers() const {
     const MoviesOptions& movies = options_.movies;
     const std::filesystem::path& table = options_.form.columnsOut;
     const std::vector<CallFile> read = {{"the list of movies", movies.list},
-                                        {"the table of --columns", options_.form.columnsFile},
-                                        {"the settings file", options_.settingsFile}};
+                                        {"the table of --columns", options_.form.columns.file},
+                                        {"the settings file", options_.settingsFile},
+                                        {"the file of --against", options_.against}};
     RefuseOutputOnto(movies.file, read);
     RefuseOutputOnto(movies.together, read);
     RefuseOutputOnto(table, read);
@@ -113,62 +110,19 @@ void DescribeRun::RefuseOutputsOntoOthers() const {
 // Which rows are for which movies is known before anything is read.
 void DescribeRun::Planned(const MoviePlan& plan) {
     RefuseOutputsOntoOthers();
-    const std::shared_ptr<const MovieColumns>& table = options_.form.columns;
     const std::filesystem::path& written = options_.form.columnsOut;
-    const bool mayBeMovie = !written.empty() && host::system::NumberOf(written).has_value();
-    std::map<const MovieColumns::Row*, std::size_t> places;
-    for (std::size_t i = 0; i < plan.size() && (table || mayBeMovie); ++i) {
-        const MovieStep step = plan[i];
-        if (!step.IsMovie()) {
-            continue;
-        }
-        if (mayBeMovie) {
-            RefuseOutputOntoMovie(written, step.movie);
-        }
-        const MovieColumns::Row* const row = table ? table->Find(step.movie) : nullptr;
-        if (row == nullptr) {
-            continue;
-        }
-        const auto [place, isFirstNow] = places.emplace(row, i);
-        auto& movie = movieOfRow_.emplace(row, step.movie).first->second;
-        std::error_code ignored;
-        if (movie == step.movie) {
-            continue;
-        }
-        if (isFirstNow && !std::filesystem::exists(movie, ignored)) {
-            movie = step.movie;  // which was moved since
-            continue;
-        }
-        const Failure clash(kExitCaller, table->file(),
-                            fmt::format("row {}: {} may be {} or {}", row->number, row->movie,
-                                        DisplayPath(std::filesystem::path(movie)),
-                                        DisplayPath(std::filesystem::path(step.movie))),
-                            "give its path");
+    RefuseOntoMovie(written);
+    rows_.Find(plan, [&](std::size_t one, std::size_t other, const Failure& why) {
         if (options_.movies.names == nullptr) {
-            throw clash;
+            throw why;
         }
         // A row of movies that come one after the other may be clear for all others.
-        RefuseMovie(place->second, clash);
-        RefuseMovie(i, clash);
-    }
-    if (!written.empty()) {
+        RefuseMovie(one, why);
+        RefuseMovie(other, why);
+    });
+    // Who reads from a pipe would take the end of a trial for that of the table.
+    if (!written.empty() && !OutputFile::IsDevice(written)) {
         OutputFile(written).TryPlace();
-    }
-}
-
-void DescribeRun::TellUnusedRows() const {
-    constexpr std::size_t kMostTold = 20;
-    const MovieColumns& table = *options_.form.columns;
-    std::size_t unused = 0;
-    for (const MovieColumns::Row& row : table.rows()) {
-        if (movieOfRow_.count(&row) == 0 && ++unused <= kMostTold) {
-            Notice("cliphost: {}: row {}: no movie is {}\n", DisplayPath(table.file()), row.number,
-                   row.movie);
-        }
-    }
-    if (unused > kMostTold) {
-        Notice("cliphost: {}: {} more are for none\n", DisplayPath(table.file()),
-               Counted(unused - kMostTold, "row"));
     }
 }
 
@@ -188,8 +142,7 @@ void DescribeRun::WriteColumns() const {
     };
     write(table.header());
     for (const auto& [movie, values] : columns_) {
-        write(
-            table.Cells(MachinePath(std::filesystem::absolute(movie).lexically_normal()), values));
+        write(table.Cells(AbsoluteMachinePath(movie), values));
     }
     out.Finish();
     const auto tellLeftOut = [&](std::size_t count, const char* thing, const std::string& why) {
@@ -205,9 +158,7 @@ void DescribeRun::WriteColumns() const {
 }
 
 MovieAnswer DescribeRun::Answer(const MovieStep& step, const PlaceOfFile& place) {
-    const Description description =
-        step.folder ? DescribeFromList(session(), step.folder->list(), step.index, step.movie)
-                    : DescribeMovie(session(), step.movie);
+    const Description description = DescriptionOf(step);
     const MovieAnswer answer = AnswerOf(session(), description, options_.form, place);
     if (bin_ && description.file) {
         AddToBin(description.file.get(), step.movie);
@@ -302,13 +253,53 @@ void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& an
     AddEntry(head, answer.description);
 }
 
+// As if the bin had been saved and was compared then.
+void DescribeRun::TellDifferences() {
+    const std::filesystem::path& file = options_.against;
+    if (IsStopped() || bin_->clips().empty()) {
+        throw Failure(kExitFile, file,
+                      IsStopped() ? "not compared: not all movies were read"
+                                  : "not compared: no movie was described");
+    }
+    ordered_json differences = ordered_json::array();
+    ComparisonLines lines;
+    const ComparisonCounts counts =
+        CompareFiles(against_.get(), bin_->file(),
+                     [&](const ComparedObject& object, const TreeDifference& difference) {
+                         if (options_.form.json) {
+                             differences.push_back(ToJson(object, difference));
+                         } else {
+                             lines.Take(object, difference);
+                         }
+                     });
+    CountStatus(StatusOf(counts));
+    if (options_.form.json) {
+        AddEntry({{"against", MachinePath(file)},
+                  {"differences", std::move(differences)},
+                  {"counts", ToJson(counts)}},
+                 "");
+    } else {
+        lines.Finish(counts);
+    }
+}
+
 void DescribeRun::Finish(int described, int failed) {
-    if (bin_) {
+    if (!options_.movies.together.empty()) {
         try {
             SaveBin();
         } catch (const Failure& failure) {
             TellAlso(failure);
             ordered_json head = {{"aaf", MachinePath(options_.movies.together)}};
+            AddProblem(failure.problem(), head);
+            AddEntry(head, "");
+        }
+    }
+    if (against_) {
+        try {
+            TellDifferences();
+        } catch (const Failure& failure) {
+            TellAlso(failure);
+            ordered_json head = {{"against", MachinePath(options_.against)}};
             AddProblem(failure.problem(), head);
             AddEntry(head, "");
         }
@@ -320,8 +311,8 @@ void DescribeRun::Finish(int described, int failed) {
             TellAlso(failure);
         }
     }
-    if (options_.form.columns && options_.movies.shard.IsWhole()) {
-        TellUnusedRows();
+    if (options_.movies.shard.IsWhole()) {
+        rows_.TellUnused();
     }
     // Movies of which nothing is known here may be those that a rule is for.
     if (doneBefore() == 0 && !IsStopped() && options_.movies.shard.IsWhole() && described > 0) {

@@ -2,13 +2,13 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <map>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
 #include <string>
 
 #include "reference_host/cliphost/Bin.h"
 #include "reference_host/cliphost/MoviesRun.h"
+#include "reference_host/cliphost/RowsOfMovies.h"
 
 namespace cliphost {
 
@@ -18,6 +18,7 @@ struct DescribeOptions {
     bool stringout = false;
     double editorRate = 25.0;            // frames per second
     std::filesystem::path settingsFile;  // that was read; empty: none
+    std::filesystem::path against;       // a file that all are compared with; empty: none
 };
 
 // Describes all movies of the command line.
@@ -32,22 +33,24 @@ private:
               const std::filesystem::path& saved) override;
     void ShowFailure(const std::filesystem::path& movie, const Problem& problem) override;
     void ShowDone(const std::filesystem::path& movie, const std::filesystem::path& saved) override;
+    bool Collects() const override { return bin_.has_value(); }
     void Collect(const std::filesystem::path& movie, const std::filesystem::path& file) override;
     void Finish(int described, int failed) override;
     void Planned(const MoviePlan& plan) override;
     void RefuseOutputsOntoOthers() const;
-    void TellUnusedRows() const;
     void WriteColumns() const;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
     void SaveBin();
+    void TellDifferences();
     void PrintSummary(int described, int failed) const;
     void AddEntry(const nlohmann::ordered_json& head, const std::string& description);
 
     const DescribeOptions& options_;
     PathMaps maps_;  // to know which were used
-    std::optional<Bin> bin_;
+    RowsOfMovies rows_;
+    std::optional<Bin> bin_;        // of what is made of all
+    host::Ref<IAAFFile> against_;   // empty: nothing is compared
     std::filesystem::path copyOf_;  // what the last movie that went into the bin is a copy of
-    std::map<const MovieColumns::Row*, std::string> movieOfRow_;
     std::vector<std::pair<std::filesystem::path::string_type, ColumnValues>> columns_;
     std::vector<std::string> entries_;  // of the JSON list that comes at the end
 };

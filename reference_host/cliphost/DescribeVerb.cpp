@@ -1,6 +1,8 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
+#include "reference_host/cliphost/ColumnsOption.h"
+#include "reference_host/cliphost/ComparisonReport.h"
 #include "reference_host/cliphost/DescribeRun.h"
 #include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
@@ -27,22 +29,13 @@ void AddForm(CLI::App& verb, DescriptionForm& form, std::string& pinned) {
     verb.add_option("--pin-time", pinned,
                     "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
                     "same movie gives the same bytes");
-    verb.add_option("--columns", form.columnsFile,
-                    "A table (CSV) with a row for each movie, told by its columns path or name: "
-                    "name, reel, start timecode, and any column of a bin, to be written into the "
-                    "descriptions");
+    AddColumnsOption(verb, form.columns);
     verb.add_option("--columns-out", form.columnsOut,
                     "Write such a table of all movies here, with what their descriptions tell");
     AddMapOption(verb, form.maps,
                  "FROM=TO, for another machine that reads what is saved: locators of movies in the "
                  "folder FROM name TO instead, which is a folder, a drive (M:) or a share "
                  "(//server/share); may be given several times, and the longest FROM counts");
-}
-
-void ReadColumns(DescriptionForm& form) {
-    if (!form.columnsFile.empty()) {
-        form.columns = std::make_shared<const MovieColumns>(form.columnsFile);
-    }
 }
 
 SessionOptions WithTime(const SessionOptions& session, const std::string& pinned) {
@@ -59,7 +52,7 @@ void AddDescribeForParent(CLI::App& app, const SessionOptions& session, int& sta
     AddForm(*verb, *form, *pinned);
     verb->callback([&session, &status, worker, form, pinned] {
         form->json = form->json || form->lines;
-        ReadColumns(*form);
+        form->columns.Read();
         Session running(WithTime(session, *pinned));
         ServeMovies(running, *worker,
                     [&](const std::filesystem::path& movie, const PlaceOfFile& place) {
@@ -113,7 +106,10 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost describe --files-from LIST --out-dir DIR --skip-done --jsonl\n"
         "  cliphost describe --files-from LIST --out-dir DIR --shard 2/16\n"
         "  cliphost describe --watch FOLDER --recursive --out-dir DIR --skip-done\n"
-        "  cliphost describe --watch /mnt/nas/in --poll 30 --out-dir DIR");
+        "  cliphost describe --watch /mnt/nas/in --poll 30 --out-dir DIR\n"
+        "  cliphost describe FOLDER --against OLD.aaf   # what a new version changes\n\n"
+        "--against compares as `cliphost compare` does; differences give status 1.\n" +
+        std::string(kLeftOutOfComparison));
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
     auto* const aaf =
@@ -133,7 +129,15 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                    "programs that show sequences alone")
         ->needs(bin);
     AddForm(*verb, options->form, *pinned);
+    auto* const against =
+        verb->add_option("--against", options->against,
+                         "Compare what is described with this AAF file, which an earlier call "
+                         "saved with --aaf or --bin, and tell in words what is other now")
+            ->excludes(aaf)
+            ->excludes("--out-dir");
     AddInputOptions(*verb, options->movies, *aaf);
+    // The file is of all movies.
+    verb->get_option("--shard")->excludes(against);
     // What was done before is not looked at, so that nothing is known of it.
     verb->get_option("--columns-out")->excludes("--skip-done");
     AddWorkerOptions(*verb, options->movies.workers);
@@ -164,12 +168,16 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
                                                  : "standard output takes what is told of movies",
                               "name a file");
             }
-            ReadColumns(options->form);
+            options->form.columns.Read();
             options->editorRate = session.host.editorFrameRate.value_or(options->editorRate);
             if (app.get_config_ptr()->count() > 0) {
                 options->settingsFile = app.get_config_ptr()->as<std::string>();
             }
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
+            if (!options->against.empty()) {
+                options->form.quiet = true;
+                options->movies.workers.arguments.emplace_back("--quiet");
+            }
             Session running(WithTime(session, *pinned));
             if (watch->isOn) {
                 status = kExitCaller;  // until a signal ends it

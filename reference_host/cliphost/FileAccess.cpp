@@ -6,6 +6,7 @@
 
 #include <cerrno>
 
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/Access.h"
 
@@ -43,7 +44,7 @@ std::filesystem::path FirstOutOfReach(const std::filesystem::path& path) {
 }
 
 Problem OutOfReach(const std::filesystem::path& path, int error) {
-    const std::filesystem::path absolute = std::filesystem::absolute(path).lexically_normal();
+    const std::filesystem::path absolute = AbsolutePath(path);
     const std::filesystem::path part = FirstOutOfReach(absolute);
     const bool isOnTheWay = part != absolute;
     if (error == EACCES) {

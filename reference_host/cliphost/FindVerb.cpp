@@ -3,6 +3,9 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+#include <utility>
+
 #include "reference_host/catalog/FindQuery.h"
 #include "reference_host/cliphost/CatalogFile.h"
 #include "reference_host/cliphost/JsonAnswer.h"
@@ -56,19 +59,24 @@ struct FindOptions {
     bool paths = false;
 };
 
-Statement Select(catalog::Catalog& catalog, const std::string& query) {
+// The numbers of the movies that fit, in the order of their paths.
+std::vector<std::int64_t> Fitting(catalog::Catalog& catalog, const std::string& query) {
     const std::vector<catalog::Term> terms = catalog::TermsOf(query);
     const catalog::Condition condition = catalog::ConditionOf(terms);
     // The index of paths gives all movies in their order, but to find some there are better ones.
     const char* const order = terms.empty() ? "path" : "+path";
     Statement select = catalog.database().Prepare(
-        fmt::format("SELECT {} FROM movies WHERE {} ORDER BY {}", kColumns, condition.sql, order));
+        fmt::format("SELECT id FROM movies WHERE {} ORDER BY {}", condition.sql, order));
     int parameter = 0;
     for (const auto& value : condition.values) {
         ++parameter;
         std::visit([&](const auto& known) { select.Bind(parameter, known); }, value);
     }
-    return select;
+    std::vector<std::int64_t> movies;
+    while (select.Step()) {
+        movies.push_back(select.Integer(0));
+    }
+    return movies;
 }
 
 ordered_json CellOf(const Statement& row, int column) {
@@ -145,36 +153,95 @@ std::string LineOfMovie(const Statement& row, const FindOptions& options) {
                                        host::text::PrintableLines(FactsOf(row)));
 }
 
+// What is printed, some movies at a time.
+class FindAnswer {
+public:
+    explicit FindAnswer(const FindOptions& options) : options_(options) {}
+
+    void Add(const Statement& row) {
+        if (options_.json) {
+            text_ += (count_ == 0 ? JsonHead() : ",") + '\n' + InLines(JsonOf(row), 4);
+        } else {
+            text_ += LineOfMovie(row, options_);
+        }
+        ++count_;
+    }
+    void Print() {
+        hasBegun_ = hasBegun_ || !text_.empty();
+        fmt::print("{}", std::exchange(text_, {}));
+    }
+    void End() {
+        if (options_.json) {
+            text_ += count_ == 0 ? JsonHead() + "]\n}\n" : "\n  ]\n}\n";
+        }
+        Print();
+    }
+
+    bool HasBegun() const { return hasBegun_; }
+    std::size_t count() const { return count_; }
+
+private:
+    // Up to the list of the movies.
+    std::string JsonHead() const {
+        std::string head =
+            InLines(WithSchema(schema::kFind, {{"catalog", MachinePath(options_.catalog)}}));
+        head.resize(head.size() - std::string_view("\n}").size());
+        return head + ",\n  \"movies\": [";
+    }
+
+    const FindOptions& options_;
+    std::string text_;
+    std::size_t count_ = 0;
+    bool hasBegun_ = false;
+};
+
+// Of many movies only the numbers are kept. They are printed while the catalog is free: who reads
+// what is printed may take his time, and nobody could write meanwhile. Movies that are removed then
+// are left out.
+void AnswerWith(const std::vector<std::int64_t>& movies, catalog::Catalog& catalog,
+                FindAnswer& answer) {
+    constexpr std::size_t kAtOnce = 500;
+    catalog::Database& database = catalog.database();
+    Statement select =
+        database.Prepare(fmt::format("SELECT {} FROM movies WHERE id = ?", kColumns));
+    for (std::size_t at = 0; at < movies.size(); at += kAtOnce) {
+        database.Run("BEGIN");
+        for (std::size_t i = at; i < std::min(at + kAtOnce, movies.size()); ++i) {
+            select.Bind(1, movies[i]);
+            while (select.Step()) {
+                answer.Add(select);
+            }
+        }
+        database.Run("COMMIT");
+        answer.Print();
+    }
+    answer.End();
+}
+
 int Find(const FindOptions& options) {
     std::string query;
     for (const std::string& word : options.words) {
         query += query.empty() ? word : " " + word;
     }
     catalog::Catalog catalog = OpenCatalog(options.catalog, catalog::Catalog::For::Reading);
-    return WithCatalog(options.catalog, [&] {
-        ordered_json movies = ordered_json::array();
-        std::string lines;
-        std::size_t count = 0;
-        try {
-            for (Statement select = Select(catalog, query); select.Step(); ++count) {
-                if (options.json) {
-                    movies.push_back(JsonOf(select));
-                } else {
-                    lines += LineOfMovie(select, options);
-                }
+    FindAnswer answer(options);
+    try {
+        WithCatalog(options.catalog, [&] {
+            try {
+                AnswerWith(Fitting(catalog, query), catalog, answer);
+            } catch (const catalog::QueryError& error) {
+                throw Failure(kExitCaller, query, error.what());
             }
-        } catch (const catalog::QueryError& error) {
-            throw Failure(kExitCaller, query, error.what());
+        });
+    } catch (const Failure& failure) {
+        if (!answer.HasBegun()) {
+            throw;
         }
-        // Only now, when the catalog is free: who reads what is printed may take his time, and
-        // nobody could write meanwhile.
-        fmt::print("{}", lines);
-        if (options.json) {
-            PrintJson(schema::kFind,
-                      {{"catalog", MachinePath(options.catalog)}, {"movies", std::move(movies)}});
-        }
-        return count > 0 ? kExitFine : kExitNothing;
-    });
+        // An answer that was begun stays without its end, so that nobody takes it for whole.
+        TellProblem(failure.problem(), 0);
+        return failure.status();
+    }
+    return answer.count() > 0 ? kExitFine : kExitNothing;
 }
 
 std::string FieldsHelp() {

@@ -22,6 +22,18 @@ ordered_json WithSchema(const char* schema, ordered_json members) {
     return whole;
 }
 
+std::string InLines(const ordered_json& json, std::size_t spaces) {
+    const std::string indentation(spaces, ' ');
+    std::string lines = indentation;
+    for (const char c : json.dump(2, ' ', false, ordered_json::error_handler_t::replace)) {
+        lines += c;
+        if (c == '\n') {
+            lines += indentation;
+        }
+    }
+    return lines;
+}
+
 void PrintJson(const char* schema, ordered_json answer) {
     if (answer.is_array()) {
         for (ordered_json& entry : answer) {
@@ -30,7 +42,7 @@ void PrintJson(const char* schema, ordered_json answer) {
     } else {
         answer = WithSchema(schema, std::move(answer));
     }
-    fmt::print("{}\n", answer.dump(2, ' ', false, nlohmann::json::error_handler_t::replace));
+    fmt::print("{}\n", InLines(answer));
 }
 
 void PrintJsonLine(std::string_view json) {

@@ -13,6 +13,9 @@ namespace cliphost {
 // An object that says first which schema it has.
 nlohmann::ordered_json WithSchema(const char* schema, nlohmann::ordered_json members);
 
+// As it is printed: in lines, each with so many spaces before it.
+std::string InLines(const nlohmann::ordered_json& json, std::size_t spaces = 0);
+
 // Prints what a verb answers to --json on standard output. It says its schema, in each entry
 // where it is a list.
 void PrintJson(const char* schema, nlohmann::ordered_json answer);

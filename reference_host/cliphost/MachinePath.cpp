@@ -13,9 +13,7 @@ std::string MachinePath(const std::filesystem::path& path) {
     if (!encodings::HoldsSurrogate(encodings::FromUtf8(bytes)) && !host::text::IsFileUrl(bytes)) {
         return bytes;
     }
-    std::error_code error;
-    const std::filesystem::path absolute = std::filesystem::absolute(path, error);
-    return host::text::FileUrl(error ? bytes : absolute.native());
+    return host::text::FileUrl(AbsolutePath(path).native());
 }
 
 std::filesystem::path AbsolutePath(const std::filesystem::path& path) {

@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/MovieAnswer.h"
 
 #include <algorithm>
+#include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/AafLocators.h"
 #include "reference_host/cliphost/AafTree.h"
@@ -20,15 +21,6 @@ namespace {
 
 constexpr std::uint64_t kMostInAnswer = 10'000;
 constexpr int kLevelOfDescription = 2;  // in the list of all entries
-
-void WriteColumns(Session& session, const Description& description, const MovieColumns& columns) {
-    if (const MovieColumns::Row* const row = columns.Find(description.movie)) {
-        SetColumns(description.file.get(), columns, *row);
-    } else if (session.verbosity() > 0) {
-        Notice("cliphost: {}: {} has no row for it\n", host::DisplayPath(description.movie),
-               host::DisplayPath(columns.file()));
-    }
-}
 
 bool IsRoute(const std::string& text) {
     for (const char* const known : {"", route::kHeader, route::kLibrary, route::kNone}) {
@@ -52,15 +44,26 @@ MovieAnswer StartAnswer(const Session& session, const Description& description) 
     return answer;
 }
 
+void WriteColumns(const Session& session, const Description& description,
+                  const GivenColumns& columns) {
+    if (!columns.table) {
+        return;
+    }
+    if (const MovieColumns::Row* const row = columns.table->Find(description.movie)) {
+        SetColumns(description.file.get(), *columns.table, *row);
+    } else if (session.verbosity() > 0) {
+        Notice("cliphost: {}: {} has no row for it\n", host::DisplayPath(description.movie),
+               host::DisplayPath(columns.file));
+    }
+}
+
 MovieAnswer AnswerOf(Session& session, const Description& description, const DescriptionForm& form,
                      const PlaceOfFile& place) {
     MovieAnswer answer = StartAnswer(session, description);
     if (!description.file) {
         return answer;
     }
-    if (form.columns) {
-        WriteColumns(session, description, *form.columns);
-    }
+    WriteColumns(session, description, form.columns);
     if (!form.columnsOut.empty()) {
         answer.columns =
             ColumnsOf(description.file.get(), CodecReader(session).ReadFirst(description.movie));
@@ -140,7 +143,8 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     }
     answer.status = static_cast<int>(status);
     if (form.json) {
-        return status != kExitFine || IsJsonOfTexts(answer.description);
+        return status != kExitFine || (form.hasNumbers ? nlohmann::json::accept(answer.description)
+                                                       : IsJsonOfTexts(answer.description));
     }
     answer.description = host::text::PrintableLines(answer.description);
     return true;

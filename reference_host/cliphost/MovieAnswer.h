@@ -4,7 +4,6 @@
 
 #include <filesystem>
 #include <functional>
-#include <memory>
 #include <string>
 #include <string_view>
 
@@ -18,12 +17,12 @@ namespace cliphost {
 // How descriptions are shown and saved.
 struct DescriptionForm {
     bool json = false;
-    bool lines = false;  // JSON of one line for each movie
+    bool hasNumbers = false;  // in the JSON, besides texts
+    bool lines = false;       // JSON of one line for each movie
     bool quiet = false;
-    PathMaps maps;                                // of the locators
-    std::filesystem::path columnsFile;            // a table of columns to write; empty: none
-    std::filesystem::path columnsOut;             // where a table of columns goes; empty: nowhere
-    std::shared_ptr<const MovieColumns> columns;  // the first one, read
+    PathMaps maps;                     // of the locators
+    GivenColumns columns;              // to be written into descriptions
+    std::filesystem::path columnsOut;  // where a table of columns goes; empty: nowhere
 };
 
 // What a verb shows of one movie, whichever process read it.
@@ -45,6 +44,10 @@ using PlaceOfFile = std::function<std::filesystem::path()>;
 // What every answer to a description begins with: its problem, and the status where there is none.
 // Tells a doubt on standard error.
 MovieAnswer StartAnswer(const Session& session, const Description& description);
+
+// Writes the movie's row of the table, where there is one, into its description. Throws a Failure.
+void WriteColumns(const Session& session, const Description& description,
+                  const GivenColumns& columns);
 
 // Tells on standard error what is told of a movie that is described, maps its locators, saves the
 // description where `place` says, which may be nowhere, and reads it.

@@ -8,6 +8,7 @@
 
 #include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/TimecodeText.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/util/text/FileUrl.h"
@@ -32,12 +33,6 @@ constexpr Use kUses[] = {
     {"tracks", ColumnUse::PassedOver},
     {"codec", ColumnUse::PassedOver},
 };
-
-std::string FullPath(const std::string& path) {
-    std::error_code error;
-    const std::filesystem::path full = std::filesystem::absolute(path, error);
-    return (error ? std::filesystem::path(path) : full).lexically_normal().native();
-}
 
 }  // namespace
 
@@ -124,7 +119,7 @@ void MovieColumns::LoadRow(const std::vector<std::string>& cells, std::uint64_t 
                           "leave one out, or name movies by their paths");
         }
     };
-    add(byPath_, FullPath(row.movie));
+    add(byPath_, AbsolutePath(row.movie));
     if (row.movie.find('/') == std::string::npos) {
         add(byName_, row.movie);
     }
@@ -146,7 +141,7 @@ void MovieColumns::CheckValue(const Row& row, const Value& value) const {
 }
 
 const MovieColumns::Row* MovieColumns::Find(const std::filesystem::path& movie) const {
-    if (const auto row = byPath_.find(FullPath(movie.native())); row != byPath_.end()) {
+    if (const auto row = byPath_.find(AbsolutePath(movie)); row != byPath_.end()) {
         return &rows_[row->second];
     }
     for (const std::filesystem::path& name : {movie.filename(), movie.stem()}) {
@@ -155,6 +150,12 @@ const MovieColumns::Row* MovieColumns::Find(const std::filesystem::path& movie) 
         }
     }
     return nullptr;
+}
+
+void GivenColumns::Read() {
+    if (!file.empty()) {
+        table = std::make_shared<const MovieColumns>(file);
+    }
 }
 
 }  // namespace cliphost

@@ -4,6 +4,7 @@
 
 #include <cstdint>
 #include <filesystem>
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -59,6 +60,14 @@ private:
     std::vector<Row> rows_;
     std::unordered_map<std::string, std::size_t> byPath_;
     std::unordered_map<std::string, std::size_t> byName_;
+};
+
+// The table that a command line may name.
+struct GivenColumns {
+    std::filesystem::path file;                 // empty: none
+    std::shared_ptr<const MovieColumns> table;  // once it is read
+
+    void Read();  // throws a Failure
 };
 
 }  // namespace cliphost

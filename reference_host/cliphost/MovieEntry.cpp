@@ -9,11 +9,11 @@
 #include <string_view>
 
 #include "reference_host/cliphost/AafTree.h"
+#include "reference_host/cliphost/ClipColumns.h"
 #include "reference_host/cliphost/JsonText.h"
 #include "reference_host/cliphost/PngFile.h"
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/RouteTaken.h"
-#include "reference_host/cliphost/TimecodeText.h"
 #include "reference_host/util/text/Number.h"
 
 namespace cliphost {
@@ -22,17 +22,7 @@ namespace {
 using catalog::Entry;
 using catalog::Row;
 
-const std::string kNothing;
 const std::vector<TreeNode> kNoNodes;
-
-const std::string& FactOf(const TreeNode& node, std::string_view name) {
-    for (const TreeNode::Fact& fact : node.facts) {
-        if (fact.name == name) {
-            return fact.value;
-        }
-    }
-    return kNothing;
-}
 
 const std::vector<TreeNode>& PartsOf(const TreeNode& node, std::string_view name) {
     for (const TreeNode::Branch& branch : node.branches) {
@@ -85,24 +75,17 @@ const TreeNode* LeadingSlot(const TreeNode& mob) {
     return picture != slots.end() ? &*picture : slots.empty() ? nullptr : &slots.front();
 }
 
-// The first timecode track of the source mob counts from 0; where in it the file begins is told by
-// the file mob.
-std::string StartOf(const TreeNode& file, const TreeNode& source) {
-    const TreeNode* const slot = LeadingSlot(file);
-    const TreeNode* const clip = slot ? PartOf(*slot, "Segment") : nullptr;
-    for (const TreeNode& track : PartsOf(source, "Slots")) {
-        const TreeNode* timecode = PartOf(track, "Segment");
-        if (timecode && timecode->title == "Sequence") {
-            timecode = PartOf(*timecode, "Components");
-        }
-        if (timecode && timecode->title == "Timecode") {
-            const std::int64_t start = NumberOf(FactOf(*timecode, "Start")) +
-                                       (clip ? NumberOf(FactOf(*clip, "StartTime")) : 0);
-            return TimecodeText(start, NumberOf(FactOf(*timecode, "FPS")),
-                                FactOf(*timecode, "Drop").compare(0, 4, "True") == 0);
+constexpr char kMasterMobClass[] = "MasterMob";
+
+// The mob whose descriptor has this class, or which has the class itself. A tape may be among them.
+const TreeNode* MobOf(const TreeNode& description, std::string_view name) {
+    for (const TreeNode& mob : PartsOf(description, "Mobs")) {
+        const TreeNode* const descriptor = PartOf(mob, "EssenceDescription");
+        if (name == (descriptor ? descriptor->title : mob.title)) {
+            return &mob;
         }
     }
-    return {};
+    return nullptr;
 }
 
 std::string PropertiesOf(const TreeNode& descriptor) {
@@ -179,12 +162,14 @@ void AddTracks(const TreeNode& file, const MovieCodecs& codecs, Entry& entry) {
     movie["channels"] = std::to_string(channels);
 }
 
-void AddColumns(const TreeNode& mob, Entry& entry) {
-    for (const TreeNode& comment : PartsOf(mob, "UserComments")) {
+void AddColumns(ColumnValues columns, const std::string& reel, Entry& entry) {
+    if (!reel.empty()) {
+        columns.emplace_back("Reel", reel);
+    }
+    for (auto& [name, value] : columns) {
         const std::string place = std::to_string(entry["columns"].size());
-        entry["columns"].push_back({{"place", place},
-                                    {"name", Unquoted(FactOf(comment, "Name"))},
-                                    {"value", Unquoted(FactOf(comment, "Value"))}});
+        entry["columns"].push_back(
+            {{"place", place}, {"name", std::move(name)}, {"value", std::move(value)}});
     }
 }
 
@@ -255,24 +240,25 @@ Entry EntryOf(const Description& description, CodecReader& codecs) {
     movie["route"] = taken.route;
     Set(movie, "route_reason", taken.reason);
     const TreeNode tree = ReadTree(description.file.get());
-    const std::vector<TreeNode>& mobs = PartsOf(tree, "Mobs");
-    constexpr std::size_t kMobs = 3;  // master, file and source
-    if (mobs.size() < kMobs) {
+    const TreeNode* const master = MobOf(tree, kMasterMobClass);
+    const TreeNode* const file = MobOf(tree, "MultipleDescriptor");
+    const TreeNode* const source = MobOf(tree, "ImportDescriptor");
+    if (!master || !file || !source) {
         return entry;
     }
-    const TreeNode& file = mobs[1];
-    Set(movie, "name", Unquoted(FactOf(mobs[0], "Name")));
-    movie["master_mob"] = FactOf(mobs[0], "MobID");
-    movie["file_mob"] = FactOf(file, "MobID");
-    movie["source_mob"] = FactOf(mobs[2], "MobID");
-    if (const TreeNode* const slot = LeadingSlot(mobs[0])) {
+    ClipTexts texts = TextsOf(description.file.get());
+    Set(movie, "name", texts.name);
+    movie["master_mob"] = FactOf(*master, "MobID");
+    movie["file_mob"] = FactOf(*file, "MobID");
+    movie["source_mob"] = FactOf(*source, "MobID");
+    if (const TreeNode* const slot = LeadingSlot(*master)) {
         SetRate(movie, FactOf(*slot, "EditRate"));
         const TreeNode* const segment = PartOf(*slot, "Segment");
         Set(movie, "length", segment ? FactOf(*segment, "Length") : "");
     }
-    Set(movie, "start", StartOf(file, mobs[2]));
-    AddTracks(file, codecs.Read(description.movie, header), entry);
-    AddColumns(mobs[0], entry);
+    Set(movie, "start", texts.start);
+    AddTracks(*file, codecs.Read(description.movie, header), entry);
+    AddColumns(std::move(texts.binColumns), texts.reel, entry);
     if (description.doubt) {
         entry["warnings"].push_back(WarningRow(description.doubt, "doubt", 0));
     }

@@ -7,6 +7,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/FolderTree.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
@@ -69,8 +70,7 @@ std::vector<std::filesystem::path> FilesIn(const std::vector<std::filesystem::pa
         if (const Problem problem = WhyUnlistable(folder)) {
             throw Failure(kExitCaller, problem);
         }
-        std::error_code ignored;
-        search.Search(std::filesystem::absolute(folder, ignored).lexically_normal());
+        search.Search(AbsolutePath(folder));
     }
     return search.Take();
 }

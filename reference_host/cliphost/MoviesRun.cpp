@@ -5,8 +5,10 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <csignal>
 #include <cstdio>
+#include <system_error>
 
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
@@ -90,7 +92,11 @@ int MoviesRun::Run() {
     Finish(done_, failed_);
     if (isStopped_) {
         TellStop();
-        std::fflush(stdout);  // the signal may end the program
+    }
+    // Before a signal takes its effect, which may also have come behind the last movie. Who reads
+    // what is printed may go away.
+    if (std::fflush(stdout) != 0 && errno != EPIPE) {
+        throw std::system_error(errno, std::generic_category(), "standard output");
     }
     return status_;
 }
@@ -102,7 +108,9 @@ void MoviesRun::RunOnce() {
 
 void MoviesRun::DoPlan(Held& held) {
     Begin();
-    RefuseOneForAllOntoMovie();
+    if (Collects()) {
+        RefuseOntoMovie(options_.together);
+    }
     Planned(plan());
     const bool isForWorkers = IsForWorkers();
     if (isForWorkers || plan().size() > 1) {
@@ -217,11 +225,17 @@ void MoviesRun::TellStop() {
            failed_, Left(), HowToGoOn());
 }
 
-// It is written when all movies were read: none of them may be there.
-void MoviesRun::RefuseOneForAllOntoMovie() const {
-    if (!options_.together.empty() && host::system::NumberOf(options_.together)) {
-        for (std::size_t i = 0; i < plan().size(); ++i) {
-            RefuseOutputOntoMovie(options_.together, plan()[i].movie);
+Description MoviesRun::DescriptionOf(const MovieStep& step) {
+    return step.folder ? DescribeFromList(session_, step.folder->list(), step.index, step.movie)
+                       : DescribeMovie(session_, step.movie);
+}
+
+void MoviesRun::RefuseOntoMovie(const std::filesystem::path& output) const {
+    const auto inItsPlace = host::system::NumberOf(output);
+    for (std::size_t i = 0; inItsPlace && i < plan().size(); ++i) {
+        const MovieStep step = plan()[i];
+        if (step.IsMovie() && host::system::NumberOf(step.movie) == inItsPlace) {
+            RefuseOutputOntoMovie(output, step.movie);
         }
     }
 }
@@ -230,7 +244,7 @@ void MoviesRun::RunHere() {
     if (plan().size() > 1) {
         progress_.emplace(doing_, plan().size());
     }
-    for (std::size_t i = 0; i < plan().size() && !DelayedSignals::HaveCome(); ++i) {
+    for (std::size_t i = 0; i < plan().size(); ++i) {
         const MovieStep step = plan()[i];
         shown_ = i;
         if (progress_) {
@@ -239,6 +253,9 @@ void MoviesRun::RunHere() {
         if (!IsToDo(i)) {
             TellInstead(i);
             continue;
+        }
+        if (DelayedSignals::HaveCome()) {
+            break;
         }
         GoOnAfterFailure(step.movie, [&] {
             std::filesystem::path saved;
@@ -286,8 +303,9 @@ void MoviesRun::RunInChildren() {
     progress_.emplace(doing_, requests.count);
     RunInWorkers(call, requests, *this);
     progress_.reset();
-    if (!DelayedSignals::HaveCome()) {
-        TellThoseBefore(plan().size());
+    // Behind the last movie, whether a signal has come or not.
+    while (nextPlace_ < plan().size() && !IsToDo(nextPlace_)) {
+        TellInstead(nextPlace_++);
     }
 }
 

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <algorithm>
 #include <cstdint>
 #include <filesystem>
 #include <map>
@@ -73,13 +74,19 @@ protected:
     }
     // For Planned: a movie is not read, but fails so.
     void RefuseMovie(std::size_t place, Failure why) { refused_.emplace(place, std::move(why)); }
+    // For what is written when all movies were read: none of them may be there. Throws a Failure.
+    void RefuseOntoMovie(const std::filesystem::path& output) const;
     const MoviePlan& plan() const { return *plan_; }
     // For Finish: whether a signal stopped the run.
     bool IsStopped() const { return isStopped_; }
 
     Session& session() { return session_; }
+    // In this process; of a folder's movie out of the module's list.
+    Description DescriptionOf(const MovieStep& step);
     // Tells a problem that is not a movie's; it counts for the exit status.
     void TellAlso(const Failure& failure);
+    // What counts for it without a problem.
+    void CountStatus(int status) { status_ = std::max(status_, status); }
 
 private:
     struct Held;
@@ -87,7 +94,6 @@ private:
     // Reads the record of the runs before, where the options ask for it.
     void LoadDone();
     void DoPlan(Held& held);
-    void RefuseOneForAllOntoMovie() const;
     bool IsForWorkers() const;
     // Finds those that are done already, and what all others are before they are read.
     void LookAtMovies();

@@ -8,6 +8,7 @@
 #include <system_error>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/framework/HostPath.h"
 
 namespace cliphost {
@@ -40,8 +41,7 @@ std::string SystemText(int error) {
 
 std::string HintFor(const std::filesystem::path& output, int error) {
     std::error_code ignored;
-    const std::filesystem::path folder =
-        std::filesystem::absolute(output, ignored).lexically_normal().parent_path();
+    const std::filesystem::path folder = AbsolutePath(output).parent_path();
     for (const Row& row : kRows) {
         if (row.error == error && row.hint &&
             (error != ENOENT || !std::filesystem::exists(folder, ignored))) {

@@ -8,6 +8,7 @@
 #include <filesystem>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
@@ -116,7 +117,7 @@ void PathMaps::Add(std::string_view rule) {
     std::string from(rule.substr(0, equals));
     if (!ReadPlace(from, added.here)) {
         // The module is given paths in this form.
-        added.here.path = std::filesystem::absolute(from).lexically_normal().generic_string();
+        added.here.path = AbsolutePath(from).generic_string();
     }
     if (!ReadPlace(std::string(rule.substr(equals + 1)), added.there)) {
         refuse("TO is no absolute path",

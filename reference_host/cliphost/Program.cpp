@@ -116,13 +116,16 @@ int Run(int argc, char** argv) {
     AddContact(app, session, status);
     AddAudio(app, session, status);
     AddDump(app, session);
+    AddCompare(app, session, status);
     AddVerify(app, session, status);
     AddRelink(app, session, status);
     AddCatalog(app, session, status);
     AddFind(app, status);
+    AddReport(app, session, status);
     AddTypes(app, session, status);
     AddParams(app, session, status);
     AddPlugin(app, session, status);
+    AddCheckData(app, session, status);
     AddValidate(app, session, status);
     AddHelpFiles(app);
     AddSettingsFile(app);

@@ -11,7 +11,9 @@
 #include "host_interfaces/util/NMALogger.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/FileAccess.h"
+#include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/data_check/Findings.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/header_parser/QTParser.h"
 #include "reference_host/parameters/RegisterParameterComponents.h"
@@ -79,6 +81,11 @@ std::string WithoutLineEnd(std::string text) {
 
 }  // namespace
 
+std::filesystem::path ModuleFile(const SessionOptions& options) {
+    return options.plugin.empty() ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"
+                                  : options.plugin;
+}
+
 std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options) {
     auto library = std::make_unique<AafLibrary>(
         options.aafLibrary.empty() ? options.programFolder / kAAFLibraryName : options.aafLibrary);
@@ -113,9 +120,7 @@ Session::Session(const SessionOptions& options)
     });
     RegisterServices(*host_);
 
-    const std::filesystem::path module =
-        options.plugin.empty() ? options.programFolder / "plugins" / "QuickTimePlugin.nvx"
-                               : options.plugin;
+    const std::filesystem::path module = ModuleFile(options);
     std::error_code ignored;
     // The module looks for its data files by the path that it was loaded from.
     if (host::system::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
@@ -140,7 +145,7 @@ std::vector<std::string> Session::TakeNotices() {
 
 std::vector<std::filesystem::path> Session::DataFiles() const {
     const std::filesystem::path folder = plugin_->file().parent_path();
-    return {folder / "FourCharMapper.xml", folder / "AAFInfo.xml"};
+    return {folder / data_check::kDataFileNames[0], folder / data_check::kDataFileNames[1]};
 }
 
 Problem BackslashProblem(const std::filesystem::path& path) {
@@ -151,9 +156,7 @@ Problem BackslashProblem(const std::filesystem::path& path) {
 }
 
 host::Ref<host::String> PathForModule(const std::filesystem::path& path) {
-    std::error_code error;
-    const std::filesystem::path absolute =
-        std::filesystem::absolute(path, error).lexically_normal();
+    const std::filesystem::path absolute = AbsolutePath(path);
     if (Problem problem = WhyUnreachable(path)) {
         throw Failure(kExitCaller, std::move(problem));
     }

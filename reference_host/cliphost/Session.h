@@ -26,6 +26,9 @@ struct SessionOptions {
     int verbosity = 0;
 };
 
+// The module that the command line means.
+std::filesystem::path ModuleFile(const SessionOptions& options);
+
 // The AAF library that the command line means, for verbs that need no module. Throws a Failure.
 std::unique_ptr<AafLibrary> LoadAafLibrary(const SessionOptions& options);
 

@@ -89,6 +89,16 @@ void AppendLines(const TreeNode& node, int indent, const std::string& property, 
 
 }  // namespace
 
+const std::string& FactOf(const TreeNode& node, std::string_view name) {
+    static const std::string nothing;
+    for (const TreeNode::Fact& fact : node.facts) {
+        if (fact.name == name) {
+            return fact.value;
+        }
+    }
+    return nothing;
+}
+
 void AppendText(const TreeNode& node, int indent, std::string& out) {
     AppendLines(node, indent, "", out);
 }

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace cliphost {
@@ -21,9 +22,14 @@ struct TreeNode {
     struct Branch {
         std::string name;
         std::vector<TreeNode> nodes;
+        bool isSet = false;  // their order means nothing
     };
     std::vector<Branch> branches;
+    bool isCut = false;  // it lies too deep: what it holds was not read
 };
+
+// The value of a fact, empty where the node has none of that name.
+const std::string& FactOf(const TreeNode& node, std::string_view name);
 
 // Indented lines, one for each fact whatever it holds.
 std::string ToText(const TreeNode& node, int indent = 0);

@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include <dlfcn.h>
 #include <malloc.h>
 
 #include <algorithm>
@@ -7,9 +8,6 @@
 #include <system_error>
 
 #include "reference_host/system/ProcessFacts.h"
-
-// There in a process that runs under a sanitizer, which has an allocator of its own.
-extern "C" __attribute__((weak)) std::size_t __sanitizer_get_current_allocated_bytes();
 
 namespace host::system {
 namespace {
@@ -21,8 +19,10 @@ std::size_t EntriesOf(const char* folder) {
 }
 
 std::size_t AllocatedBytes() {
-    if (__sanitizer_get_current_allocated_bytes != nullptr) {
-        return __sanitizer_get_current_allocated_bytes();
+    // There in a process that runs under a sanitizer, which has an allocator of its own.
+    using AllocatedNow = std::size_t (*)();
+    if (void* const place = dlsym(RTLD_DEFAULT, "__sanitizer_get_current_allocated_bytes")) {
+        return reinterpret_cast<AllocatedNow>(place)();
     }
     const struct mallinfo2 facts = mallinfo2();
     return facts.uordblks + facts.hblkhd;

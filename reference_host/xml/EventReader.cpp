@@ -35,11 +35,12 @@ struct EventReader::State {
     int depth = 0;
     NCFRESULT result = NCF_OK;
     std::string problem;
+    XmlPlace problemPlace;
+    std::string problemText;
     bool byReceiver = false;
 
-    std::string Here() const {
-        return std::to_string(XML_GetCurrentLineNumber(parser)) + ":" +
-               std::to_string(XML_GetCurrentColumnNumber(parser) + 1) + ": ";
+    XmlPlace Here() const {
+        return {XML_GetCurrentLineNumber(parser), XML_GetCurrentColumnNumber(parser) + 1};
     }
 
     // The first failure counts. The parser may deliver a few events more after
@@ -49,7 +50,10 @@ struct EventReader::State {
             return;
         }
         result = code;
-        problem = Here() + what;
+        problemPlace = Here();
+        problemText = what;
+        problem = std::to_string(problemPlace.line) + ":" + std::to_string(problemPlace.column) +
+                  ": " + what;
         XML_StopParser(parser, XML_FALSE);
     }
 
@@ -83,6 +87,13 @@ struct EventReader::State {
             return;
         }
         const NCFRESULT taken = events.OnElement(name, attributes);
+        if (taken < 0) {
+            FailFromReceiver(taken);
+        }
+    }
+
+    void ElementEnd() {
+        const NCFRESULT taken = result < 0 ? NCF_OK : events.OnElementEnd();
         if (taken < 0) {
             FailFromReceiver(taken);
         }
@@ -125,6 +136,7 @@ struct EventReader::State {
         Run(user, [](State& state) {
             state.Flush();
             --state.depth;
+            state.ElementEnd();
         });
     }
     static void XMLCALL OnCharacters(void* user, const char* text, int length) {
@@ -180,6 +192,23 @@ NCFRESULT EventReader::Feed(const char* bytes, std::size_t size, bool last) {
         size -= piece;
     } while (size > 0);
     return state.result;
+}
+
+XmlPlace EventReader::place() const {
+    return state_->Here();
+}
+
+std::uint64_t EventReader::byteOffset() const {
+    const XML_Index offset = XML_GetCurrentByteIndex(state_->parser);
+    return offset < 0 ? 0 : static_cast<std::uint64_t>(offset);
+}
+
+XmlPlace EventReader::problemPlace() const {
+    return state_->problemPlace;
+}
+
+const std::string& EventReader::problemText() const {
+    return state_->problemText;
 }
 
 const std::string& EventReader::problem() const {

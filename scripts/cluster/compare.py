@@ -68,9 +68,10 @@ def main(one, out, movies, shares):
         faults.append(f"the single catalog has {len(single['movies'])} movies of {count}")
     faults += [f"the table {table} differs" for table in single if merged.get(table) != single[table]]
     files = [file for file in out.rglob("*") if file.is_file()]
-    parts = [file for file in files if file.suffix == ".part"]  # what a killed run was writing
-    known = (".aaf", ".jsonl", ".sqlite", ".part", ".log")
-    faults += [f"{file} is left over" for file in files if file.suffix not in known]
+    # What a killed run was writing, and what its child processes were.
+    parts = [file for file in files if file.suffix == ".part" or file.relative_to(out).match("*/cliphost-*/*/*")]
+    known = (".aaf", ".jsonl", ".sqlite", ".log")
+    faults += [f"{file} is left over" for file in files if file not in parts and file.suffix not in known]
     for fault in faults:
         print(fault)
     again = len(done) - len(set(done))

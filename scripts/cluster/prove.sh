@@ -45,7 +45,7 @@ start_slurm "$farm/slurm" "${nodes[@]}" || fail "Slurm does not start"
 export CLIPHOST=$build/cliphost
 begin
 job=$(sbatch --parsable --array="1-$shares" --output="$farm/log/%a" "$here/describe.sbatch" \
-  "$shares" "$farm/movies" "$farm/out" "${pinned[@]}")
+  "$shares" "$farm/movies" "$farm/out" -- "${pinned[@]}")
 say "Slurm has ${#nodes[@]} nodes, and $shares tasks to do"
 
 tasks_of_node() { squeue --noheader --states=R --nodelist="$1" --format=%K; }
@@ -96,7 +96,7 @@ while read -r task; do
 done < <(grep -l " on $drained\$" log/[0-9]* | sed 's|log/||')
 
 merge=$(sbatch --parsable --dependency="afterany:$job" --output="$farm/log/merge" \
-  --wrap "'$CLIPHOST' catalog --merge '$farm/out/'*[0-9].sqlite -o '$farm/out/all.sqlite'")
+  --wrap "'$CLIPHOST' catalog --merge $(seq -s ' ' -f "$farm/out/%g.sqlite" "$shares") -o '$farm/out/all.sqlite'")
 job=$merge
 until_true 60 all_ended || fail "the catalogs are not merged"
 cat log/merge
@@ -111,7 +111,7 @@ say "of the catalog, task ${hit_tasks[-1]} may have done as many again as its ne
 
 printf '2/:\n' >hosts
 say "the same by GNU parallel, 4 shares:"
-"$here/describe_ssh.sh" hosts 4 "$farm/movies" "$farm/out-ssh" "${pinned[@]}" >log/ssh
+"$here/describe_ssh.sh" hosts 4 "$farm/movies" "$farm/out-ssh" -- "${pinned[@]}" >log/ssh
 is_as_single out-ssh 4
 
 rm -rf movies one out out-ssh  # kept where something was wrong

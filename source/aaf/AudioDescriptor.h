@@ -2,13 +2,12 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
 #include "host_interfaces/aaf/AAFDescriptors.h"
 #include "host_interfaces/aaf/AAFDictionary.h"
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/clips/BaseClip.h"
+#include "source/plugin/Tr1Memory.h"
 
 namespace NMA::Impl {
 

@@ -2,12 +2,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/clips/BaseClip.h"
 #include "source/descriptor_data/AAFInfo.h"
+#include "source/plugin/Tr1Memory.h"
 
 namespace NMA::Impl {
 

@@ -2,10 +2,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
 #include "host_interfaces/aaf/AAFFile.h"
 #include "source/clips/BaseClip.h"
+#include "source/plugin/Tr1Memory.h"
 
 namespace NMA::Impl {
 

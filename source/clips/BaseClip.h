@@ -2,13 +2,12 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
 #include "source/clips/ClipRecords.h"
 #include "source/clips/MovieServices.h"
 #include "source/clips/PictureFacts.h"
 #include "source/clips/SampleProviderRule.h"
 #include "source/plugin/ByteVector.h"
+#include "source/plugin/Tr1Memory.h"
 
 struct AAFInfo;
 

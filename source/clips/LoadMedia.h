@@ -2,9 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
 #include "source/clips/BaseClip.h"
+#include "source/plugin/Tr1Memory.h"
 
 // The door of the clips: from a path to a loaded clip.
 

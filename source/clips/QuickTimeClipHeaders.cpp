@@ -5,12 +5,12 @@
 
 #include <cstring>
 #include <new>
-#include <tr1/memory>
 
 #include "public_include/SimpleFileIO.h"
 #include "source/clips/QuickTimeClip.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/ResultChecks.h"
+#include "source/plugin/Tr1Memory.h"
 #include "source/plugin/os/Os.h"
 
 namespace {

@@ -2,9 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
 #include "source/clips/BaseClip.h"
+#include "source/plugin/Tr1Memory.h"
 
 // Which way the host is to read a clip's essence: 1 directly from the file, 0
 // through the module's sample provider, negative failure. A 0 is told to the

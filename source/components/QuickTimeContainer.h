@@ -3,7 +3,6 @@
 #pragma once
 
 #include <memory>
-#include <tr1/memory>
 
 #include "host_interfaces/framework/Capability.h"
 #include "host_interfaces/framework/Console.h"
@@ -11,6 +10,7 @@
 #include "source/aaf/AAFSmartPointer.h"
 #include "source/plugin/CNCFUnknown.h"
 #include "source/plugin/NCFSmartPtr.h"
+#include "source/plugin/Tr1Memory.h"
 
 class BaseClip;
 

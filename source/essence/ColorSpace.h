@@ -2,9 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
-
 #include "source/clips/BaseClip.h"
+#include "source/plugin/Tr1Memory.h"
 
 // From this size on a picture counts as high definition and is Rec. 709.
 inline constexpr ncfUInt32 kHighDefinitionWidth = 960;

@@ -2,11 +2,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
 #include <vector>
 
 #include "host_interfaces/framework/ResultCodes.h"
 #include "source/essence/MediaFormat.h"
+#include "source/plugin/Tr1Memory.h"
 
 using MediaFormatPtr = std::tr1::shared_ptr<MediaFormat>;
 

@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
 #include <vector>
 
 #include "host_interfaces/framework/Console.h"
@@ -13,6 +12,7 @@
 #include "source/essence/MediaTrack.h"
 #include "source/plugin/CNCFUnknown.h"
 #include "source/plugin/NCFSmartPtr.h"
+#include "source/plugin/Tr1Memory.h"
 
 namespace NMA::Impl {
 

@@ -2,10 +2,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <tr1/memory>
 #include <vector>
 
 #include "source/clips/BaseClip.h"
+#include "source/plugin/Tr1Memory.h"
 
 // The movie's track id for each track number of the host: the first picture
 // track, the same again for its alpha when the clip shows one, then the sound

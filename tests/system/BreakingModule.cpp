@@ -101,6 +101,8 @@ void DoHarm(const std::string& harm, const std::filesystem::path& movie) {
     if (harm == "crash") {
         std::signal(SIGSEGV, SIG_DFL);  // a sanitizer has its own
         std::raise(SIGSEGV);
+    } else if (harm == "interrupt") {
+        std::raise(SIGTERM);
     } else if (harm == "leave") {
         _exit(3);
     } else if (harm == "hang") {

@@ -132,6 +132,54 @@ TEST_F(Catalogs, KeepWhatMoviesAre) {
     EXPECT_EQ(of("master_mob", "mjpeg"), described[0]["description"]["Mobs"][0]["MobID"]);
 }
 
+// By the same table as `describe`, with the same rules.
+TEST_F(Catalogs, TakeColumnsOfATable) {
+    for (const char* const name : {"in/a.mov", "in/b.mov", "in/c.mov"}) {
+        Copy("png.mov", name);
+    }
+    const auto table = [&](const std::string& text) {
+        std::ofstream(folder() / "list.csv", std::ios::binary) << text;
+    };
+    table("name,reel,start timecode,Scene\na,A001,10:00:00:05,\"12 \"\"x\"\"\"\nb,B001,,7\nz,,,\n");
+    for (const char* const jobs : {"1", "2"}) {
+        const CommandResult ran =
+            Run("catalog in -o c.sqlite --columns list.csv --jobs " + std::string(jobs));
+        ExpectSays(ran, 0, "3 catalogued, 0 not\n");
+        ExpectSays(ran, 0, "list.csv: row 4: no movie is z\n");
+        EXPECT_EQ(Ask("SELECT movies.name, columns.name, value FROM columns JOIN movies ON id = "
+                      "movie WHERE columns.name IN ('Reel', 'Scene') ORDER BY 1, 2"),
+                  (Rows{"a|Reel|A001", "a|Scene|12 \"x\"", "b|Reel|B001", "b|Scene|7"}));
+        EXPECT_EQ(Ask("SELECT name, start FROM movies ORDER BY name"),
+                  (Rows{"a|10:00:00:05", "b|00:00:00:00", "c|00:00:00:00"}));
+    }
+    EXPECT_EQ(Run("find c.sqlite 'reel:A0*' -0").out,
+              (folder() / "in/a.mov").native() + std::string(1, '\0'));
+    EXPECT_EQ(Run("find c.sqlite tape:B001").status, 0);
+    EXPECT_EQ(Run("find c.sqlite A001").status, 0);
+    // Ids, tracks and descriptors are those without a table.
+    Run("catalog in -o plain.sqlite");
+    constexpr char kSame[] =
+        "SELECT path, master_mob, file_mob, source_mob, codec, length, class, properties FROM "
+        "movies JOIN descriptors ON id = movie ORDER BY path";
+    EXPECT_EQ(Ask(kSame), Ask(kSame, "plain.sqlite"));
+    // Another table makes other rows.
+    const std::string update = "catalog in -o c.sqlite --columns list.csv --update";
+    ExpectSays(Run(update), 0, "0 catalogued, 0 not, 3 as before");
+    table("name,reel,start\na,A002,\nc,,01:00:00:25\n");
+    const CommandResult ran = Run(update);
+    ExpectSays(ran, 2, "list.csv: row 3, column start: '01:00:00:25' is no timecode at 25 frames");
+    ExpectSays(ran, 2, "2 catalogued, 1 not");
+    EXPECT_EQ(Ask("SELECT value FROM columns WHERE name = 'Reel'"), Rows{"A002"});
+    EXPECT_EQ(Ask("SELECT name FROM movies WHERE failed"), Rows{"c"});
+    // What a row may mean is known before anything is read.
+    Copy("png.mov", "in/sub/a.mov");
+    const Rows content = Content();
+    ExpectSays(Run(update + " --recursive"), 2, "list.csv: row 2: a may be ");
+    EXPECT_EQ(Content(), content);
+    ExpectSays(Run("catalog --merge c.sqlite -o d.sqlite --columns list.csv"), 2, "excludes");
+    ExpectSays(Run("catalog in -o list.csv --columns list.csv"), 2, "list.csv: is no SQLite file");
+}
+
 TEST_F(Catalogs, OfTheSecondRouteKnowCodecsToo) {
     Make(
         "-f lavfi -i testsrc2=s=64x48:r=25:d=1 -f lavfi -i sine=d=1:r=48000 -c:v mpeg2video -c:a "
@@ -167,8 +215,11 @@ TEST_F(Catalogs, KnowWhereAPathBehindALinkLeads) {
     EXPECT_EQ(Names(), real);
     ExpectSays(Run("catalog link/.. --extensions mov -o c.sqlite --update"), 0,
                "0 catalogued, 0 not, 1 as before, 0 gone\n");
-    Run("catalog link/../a.mov -o named.sqlite");  // which the module doesn't find
-    EXPECT_EQ(Names("named.sqlite"), real);
+    for (const char* const call : {"link/../a.mov", "link/..", "real/../link/../a.mov"}) {
+        ExpectSays(Run(std::string("catalog ") + call + " -o other.sqlite"), 0,
+                   "1 catalogued, 0 not\n");
+        EXPECT_EQ(Content("other.sqlite"), Content()) << call;
+    }
 }
 
 TEST_F(Catalogs, AreTheSameOfOneProcessAndOfSeveral) {
@@ -307,6 +358,46 @@ TEST_F(Catalogs, KeepWhatTheCallWouldNotHaveFound) {
         gone += std::stoi(count[1]);
     }
     EXPECT_EQ(gone, 2);
+}
+
+// As where nothing is mounted.
+TEST_F(Catalogs, StayWhereNoMovieIsFound) {
+    Copy("png.mov", "in/a.mov");
+    std::filesystem::create_directory(folder() / "empty");
+    std::ofstream(folder() / "list") << "gone.mov\nin/gone.mov\n";
+    Run("catalog in -o c.sqlite");
+    const std::string before = TextOf(folder() / "c.sqlite");
+    for (const char* const call : {"empty", "empty --recursive", "gone.mov", "gone",
+                                   "--files-from list", "empty --extensions mov --shard 1/4"}) {
+        const CommandResult ran = Run(std::string("catalog -o c.sqlite ") + call);
+        EXPECT_GE(ran.status, 1) << call;
+        EXPECT_NE(ran.out.find("c.sqlite: no movie was found; the catalog is left as it was\n"),
+                  std::string::npos)
+            << ran.out;
+        EXPECT_TRUE(TextOf(folder() / "c.sqlite") == before) << call;
+        EXPECT_EQ(FilesNamed("c.sqlite"), 1u) << call;
+    }
+    ExpectSays(Run("catalog -o c.sqlite empty --jsonl"), 1,
+               "\"reason\":\"no movie was found; the catalog is left as it was\"");
+    // One that can't be described was found.
+    Write(movies::Bytes(100, 'x'), "bad.mov");
+    Run("catalog bad.mov -o c.sqlite");
+    EXPECT_EQ(Names(), Rows{"bad.mov"});
+    // There is none to keep.
+    EXPECT_EQ(Run("catalog empty -o new.sqlite").status, 1);
+    EXPECT_EQ(Names("new.sqlite"), Rows{});
+}
+
+// A catalog without pictures gets those of movies that stayed as they were, too.
+TEST_F(Catalogs, GetThumbnailsLater) {
+    Copy("png.mov", "in/a.mov");
+    Copy("aac.mov", "in/sound.mov");
+    Run("catalog in -o c.sqlite");
+    for (const char* const summary : {"2 catalogued, 0 not, 0 as before, 0 gone\n",
+                                      "0 catalogued, 0 not, 2 as before, 0 gone\n"}) {
+        ExpectSays(Run("catalog in -o c.sqlite --update --thumbnails"), 0, summary);
+        EXPECT_EQ(Ask("SELECT name FROM thumbnails JOIN movies ON id = movie"), Rows{"a"});
+    }
 }
 
 // As where a disk goes away in the midst of a run.
@@ -467,6 +558,8 @@ TEST_F(Catalogs, WaitForALockAndThenSaySo) {
         Database other(folder() / "c.sqlite", Database::Access::Change);
         other.Run("BEGIN IMMEDIATE");
         EXPECT_EQ(Run("find c.sqlite").status, 0);
+        // Nor an update that has nothing to write.
+        ExpectSays(Run("catalog in -o c.sqlite --update"), 0, "0 catalogued, 0 not, 1 as before");
         Copy("png.mov", "in/b.mov");
         ExpectSays(Run("catalog in -o c.sqlite --update"), 2, "another program has kept it locked");
     }
@@ -510,6 +603,8 @@ TEST_F(Catalogs, OfAReadOnlyDiskAreRead) {
         ExpectSays(Run(std::string("catalog in -o disk/c.sqlite") + update), 2,
                    "disk/c.sqlite: not written: ");
     }
+    std::filesystem::remove(folder() / "in/b.mov");
+    ExpectSays(Run("catalog in -o disk/c.sqlite --update"), 0, "0 catalogued, 0 not, 1 as before");
     EXPECT_EQ(Names("disk/c.sqlite"), Rows{"in/a.mov"});
     RunCommand("umount " + In("disk"));
 }
@@ -582,8 +677,15 @@ TEST_F(StoppedCatalogs, AreWholeAndGoOn) {
 }
 
 TEST_F(StoppedCatalogs, WithoutUpdateKeepTheOneThatWasThere) {
-    const std::string wait = "[ $(ls | grep -c 'c.sqlite') -gt 0 ] && sleep 0.15";
-    EXPECT_EQ(Stop("catalog in -o c.sqlite --jobs 2", "TERM", wait), "143\n");
+    // A run that is stopped before its first movie makes no catalog.
+    for (const char* const pause : {"0.05", "0.15", "0.5", "1.5", "5"}) {
+        const std::string wait =
+            "[ $(ls | grep -c 'c.sqlite') -gt 0 ] && sleep " + std::string(pause);
+        EXPECT_EQ(Stop("catalog in -o c.sqlite --jobs 2", "TERM", wait), "143\n");
+        if (std::filesystem::exists(folder() / "c.sqlite")) {
+            break;
+        }
+    }
     EXPECT_NE(Told().find("; the same call with --update goes on\n"), std::string::npos) << Told();
     const Rows first = Content();
     EXPECT_LT(Names().size(), static_cast<std::size_t>(kMovies));
@@ -645,13 +747,78 @@ TEST_F(FindVerb, KeepsNobodyFromWritingWhileItsReaderRests) {
     std::FILE* const reader = popen(call.c_str(), "r");
     ASSERT_TRUE(reader);
     int c = std::fgetc(reader);  // from here on the pipe is full
-    EXPECT_NO_THROW(database.Run("DELETE FROM movies WHERE id = 1"));
+    // One that was printed, and one that wasn't.
+    EXPECT_NO_THROW(database.Run("DELETE FROM movies WHERE id IN (1, 999)"));
     int lines = 0;
     for (; c != EOF; c = std::fgetc(reader)) {
         lines += c == '\n' ? 1 : 0;
     }
     EXPECT_EQ(pclose(reader), 0);
-    EXPECT_EQ(lines, 5005);
+    EXPECT_EQ(lines, 5004);
+}
+
+// What a movie takes is printed before others are read.
+TEST_F(FindVerb, HoldsNoMoreOfManyMoviesThanOfFew) {
+    const auto memory = [&](int movies, const std::string& form) {
+        Database(folder() / "c.sqlite", Database::Access::Change)
+            .Run(
+                ("DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM "
+                 "n WHERE i < " +
+                 std::to_string(movies) +
+                 ") INSERT INTO movies (id, path, name, size, date, looked, settings, failed) "
+                 "SELECT i, '/' || i || hex(zeroblob(200)), '', 1, 1, 1, '', 0 FROM n")
+                    .c_str());
+        // At the first byte, in kilobytes.
+        const CommandResult ran = RunCommand(
+            "cd " + Quoted(folder()) + "; sh -c 'echo $$ >pid; exec \"$0\" find c.sqlite " + form +
+            "' " + Quoted(ProgramFolder() / "cliphost") +
+            " | { head -c 1 >/dev/null; grep VmHWM /proc/$(cat pid)/status | tr -cd 0-9; }");
+        return std::stol(ran.out);
+    };
+    for (const char* const form : {"", "--json"}) {
+        const long few = memory(1000, form);
+        EXPECT_LT(memory(60'000, form), few + 15'000) << form;  // of 25 MB and more
+    }
+}
+
+// All of it, where it takes several readings.
+TEST_F(FindVerb, GivesWholeJsonOfManyMovies) {
+    Database(folder() / "c.sqlite", Database::Access::Change)
+        .Run(
+            "DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
+            "WHERE i < 1500) INSERT INTO movies (id, path, name, size, date, looked, settings, "
+            "failed) SELECT i, printf('/%06d', 1500 - i), '', 1, 1, 1, '', 0 FROM n");
+    const std::string printed = Run("find c.sqlite --json").out;
+    const Json answer = Json::parse(printed);
+    ASSERT_EQ(answer["movies"].size(), 1500u);
+    for (std::size_t i = 1; i < 1500; ++i) {
+        EXPECT_LT(answer["movies"][i - 1]["path"], answer["movies"][i]["path"]);
+    }
+    EXPECT_EQ(printed, answer.dump(2) + "\n");
+    const std::string none = Run("find c.sqlite nowhere --json").out;
+    EXPECT_EQ(none, Json::parse(none).dump(2) + "\n");
+}
+
+// What was printed of a catalog that can't be read to its end is no whole answer.
+TEST_F(FindVerb, LeavesJsonOpenWhereTheCatalogIsDamaged) {
+    Database(folder() / "c.sqlite", Database::Access::Change)
+        .Run(
+            "DELETE FROM movies; WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n "
+            "WHERE i < 5000) INSERT INTO movies (id, path, name, size, date, looked, settings, "
+            "failed) SELECT i, printf('/%06d', i), hex(zeroblob(200)), 1, 1, 1, 'last' || i, 0 "
+            "FROM n");
+    std::string bytes = TextOf(folder() / "c.sqlite");
+    const std::size_t page = bytes.find("last4900") / 4096 * 4096;
+    std::fill_n(bytes.begin() + static_cast<std::ptrdiff_t>(page), 4096, '\x55');
+    std::ofstream(folder() / "c.sqlite", std::ios::binary) << bytes;
+    const CommandResult ran =
+        RunCommand("cd " + Quoted(folder()) + "; " + Quoted(ProgramFolder() / "cliphost") +
+                   " find c.sqlite --json 2>told");
+    EXPECT_EQ(ran.status, 2);
+    EXPECT_NE(ran.out.find("\"path\": \"/000001\""), std::string::npos);
+    EXPECT_TRUE(Json::parse(ran.out, nullptr, false).is_discarded());
+    EXPECT_NE(TextOf(folder() / "told").find("c.sqlite: the catalog is damaged: "),
+              std::string::npos);
 }
 
 TEST_F(FindVerb, EndsWithAStatusThatTells) {

@@ -244,6 +244,11 @@ TEST_F(Columns, NameWhatIsWrong) {
     ran = RunCommand(Quoted(ProgramFolder() / "cliphost") + " describe --columns-out /dev/fd/3 " +
                      movie + "3>&1 >" + In("told"));
     ExpectSays(ran, 0, "path,name,reel");
+    ran = RunCommand("mkfifo " + In("pipe") + "; cat " + In("pipe") + " & timeout 60 " +
+                     Quoted(ProgramFolder() / "cliphost") + " describe --columns-out " +
+                     In("pipe") + " " + movie + ">/dev/null; echo $?; wait");
+    ExpectSays(ran, 0, "path,name,reel");
+    ExpectSays(ran, 0, "0\n");
     ExpectSays(RunCliphost("describe --skip-done --out-dir " + In("x") + " --columns-out " +
                            In("y") + " " + movie),
                2, "excludes");

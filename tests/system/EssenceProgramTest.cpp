@@ -235,8 +235,8 @@ TEST_F(EssenceProgram, ShowsNoProgressWhereThereIsNoTerminal) {
 
 TEST_F(EssenceProgram, HelpsWithExamplesForEachVerb) {
     for (const std::string verb :
-         {"scan", "describe", "dump", "verify", "relink", "samples", "formats", "frame", "contact",
-          "params", "audio", "types", "plugin"}) {
+         {"scan", "describe", "dump", "compare", "verify", "relink", "samples", "formats", "frame",
+          "contact", "params", "audio", "types", "plugin", "check-data"}) {
         ExpectSays(RunCliphost(verb + " --help"), 0, "Examples:\n  cliphost " + verb);
     }
 }

@@ -19,6 +19,7 @@
 #include <sstream>
 #include <thread>
 
+#include "reference_host/util/text/FileUrl.h"
 #include "tests/system/Command.h"
 #include "tests/system/SystemTest.h"
 
@@ -289,6 +290,38 @@ TEST_F(Inputs, ComeOutOfFoldersByTheirEndings) {
     Run("describe in/a.mov --aaf named.aaf" + std::string(kPinned));
     Run("describe in --extensions mov --out-dir out" + std::string(kPinned));
     EXPECT_EQ(ReadFile(folder() / "out/a.aaf"), ReadFile(folder() / "named.aaf"));
+}
+
+// Whatever the working folder is, and by whichever way: the same locators.
+TEST_F(Inputs, AreDescribedAlikeHoweverTheyAreNamed) {
+    Copy("real/in/a.mov");
+    std::filesystem::create_directories(folder() / "real/in/sub");
+    std::filesystem::create_directory_symlink("real/in/sub", folder() / "link");
+    Run("describe " + In("real/in/a.mov") + " --aaf whole.aaf" + kPinned);
+    const movies::Bytes whole = ReadFile(folder() / "whole.aaf");
+    const std::string url = host::text::FileUrl((folder() / "real/in/a.mov").native());
+    EXPECT_NE(Run("dump whole.aaf").out.find("\"" + url + "\""), std::string::npos);
+    const struct {
+        const char *from, *inputs;
+    } calls[] = {{".", "real/in/a.mov"},
+                 {".", "real/in"},
+                 {".", "./real/../real/in/a.mov"},
+                 {".", "link/../a.mov"},
+                 {".", "link/.."},
+                 {".", "link/.. --extensions mov"},
+                 {".", "link/../.. --recursive"},
+                 {".", "link/../a.mov --limit-seconds 60"},
+                 {"real/in", "a.mov"},
+                 {"real/in", "."},
+                 {"real/in/sub", "../a.mov"},
+                 {"link", "../../in"}};
+    for (const auto& call : calls) {
+        std::filesystem::remove_all(folder() / "out");
+        Run(std::string("describe ") + call.inputs + " --out-dir " + In("out") + kPinned,
+            "cd " + std::string(call.from) + " && ");
+        EXPECT_EQ(NamesIn(folder() / "out"), Names{"a.aaf"}) << call.inputs;
+        EXPECT_EQ(ReadFile(folder() / "out/a.aaf"), whole) << call.from << ": " << call.inputs;
+    }
 }
 
 TEST_F(Inputs, AreShownInLinesThatAreTheEntriesOfAList) {
@@ -762,6 +795,26 @@ TEST_F(Stopped, LeavesWholeFiles) {
     EXPECT_EQ(CountOutputs(".aaf"), kMovies - 1);
 }
 
+class StoppedReports : public Stopped {
+protected:
+    bool HasBegun() override { return Told().find("1001.mov") != std::string::npos; }
+};
+
+TEST_F(StoppedReports, HaveWhatWasReadUnlessThereWasOneBefore) {
+    const std::vector<std::string> call = {"report", "in", "-o", "r.html", "--jobs", "1"};
+    const Left left = Stop(SIGINT, call);
+    const std::string page = TextOf(folder() / "r.html");
+    EXPECT_NE(page.find("\"isWhole\":false"), std::string::npos);
+    const auto hasClip = [&](int number) {
+        return page.find("id=\"clip-" + std::to_string(number) + "\"") != std::string::npos;
+    };
+    EXPECT_TRUE(hasClip(left.done + left.failed - 1));
+    EXPECT_FALSE(hasClip(left.done + left.failed));
+    std::filesystem::remove(folder() / "told");
+    EXPECT_NE(Stop(SIGTERM, call).told.find("r.html: left as it was"), std::string::npos);
+    EXPECT_TRUE(TextOf(folder() / "r.html") == page);
+}
+
 TEST_F(Stopped, GoesOnWithSheets) {
     const Left left = Stop(SIGTERM, {"contact", "in", "--width", "16", "--frames", "1",
                                      "--skip-done", "--out-dir", "out"});
@@ -803,6 +856,37 @@ TEST_F(Stopped, WritesNoPartOfABin) {
         const std::vector<Json> lines = LinesOf(TextOf(folder() / "lines"));
         EXPECT_EQ(lines.back()["reason"], "not written: not all movies were read");
     }
+}
+
+// A signal that comes when the last movie is read finds nothing that could still be lost.
+TEST_F(Inputs, AreKeptWhereASignalComesBehindTheLast) {
+    Copy("a.mov");
+    Copy("interrupt.mov");
+    Copy("b.mov");
+    std::filesystem::create_directory(folder() / "empty");
+    Run("catalog b.mov -o all.sqlite");
+    const auto run = [&](const std::string& arguments) {
+        const CommandResult ran =
+            RunCommand("cd " + Quoted(folder()) + "; env --default-signal=TERM " + Program() +
+                       " --plugin " + Quoted(ProgramFolder() / "tests/BreakingModule.nvx") + " " +
+                       arguments + " --jobs 1 >printed 2>told; echo $?");
+        EXPECT_EQ(ran.out, "143\n") << arguments;
+        EXPECT_EQ(Told().find("not all movies were read"), std::string::npos) << Told();
+        return TextOf(folder() / "printed");
+    };
+    const std::string described =
+        run("describe a.mov interrupt.mov empty --json --bin all.aaf --columns-out all.csv");
+    const Json list = Json::parse(described, nullptr, false);
+    ASSERT_EQ(list.size(), 3u) << described;
+    EXPECT_EQ(list[2]["reason"], "not claimed: no file in it is named *.mov");
+    ExpectSays(RunCliphost("verify " + In("all.aaf")), 0, "1 clip: 1 same");
+    EXPECT_NE(TextOf(folder() / "all.csv").find("interrupt.mov"), std::string::npos);
+    EXPECT_EQ(run("catalog a.mov interrupt.mov -o all.sqlite"), "2 catalogued, 0 not\n");
+    EXPECT_EQ(Run("find all.sqlite name:b").status, 1);
+    EXPECT_EQ(Run("find all.sqlite name:interrupt").status, 0);
+    EXPECT_NE(run("describe a.mov interrupt.mov -q --out-dir out").find("2 described, 0 not\n"),
+              std::string::npos);
+    EXPECT_EQ(NamesIn(folder() / "out"), (Names{"a.aaf", "interrupt.aaf"}));
 }
 
 TEST_F(Inputs, AreNeverReplacedByAnOutputOfTheSameRun) {

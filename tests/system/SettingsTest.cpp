@@ -233,8 +233,9 @@ TEST_F(SettingsFile, TakesEveryOptionOfEveryVerb) {
     const std::set<std::string> none = {"help", "version", "config", "no-config"};
     std::size_t options = 0;
     for (const char* const verb :
-         {"", "scan", "describe", "samples", "formats", "frame", "contact", "audio", "dump",
-          "verify", "relink", "types", "params", "plugin", "catalog", "find", "validate"}) {
+         {"",       "scan",       "describe", "samples", "formats",  "frame", "contact",
+          "audio",  "dump",       "compare",  "verify",  "relink",   "types", "params",
+          "plugin", "check-data", "catalog",  "find",    "validate", "report"}) {
         for (const std::string& name : OptionsOf(verb)) {
             if (none.count(name) == 0) {
                 ++options;

@@ -3,11 +3,11 @@
 
 // The operating system, by its calls on 64-bit Windows.
 
+#include "source/plugin/os/Os.h"
+
 #include <windows.h>
 
 #include <malloc.h>
-
-#include "source/plugin/os/Os.h"
 
 namespace os {
 namespace {
@@ -16,8 +16,8 @@ HANDLE AsHandle(FileHandle file) {
     return reinterpret_cast<HANDLE>(file);
 }
 
-const wchar_t* Wide(const std::u16string& text) {
-    return reinterpret_cast<const wchar_t*>(text.c_str());
+LPCWSTR Wide(const std::u16string& text) {
+    return reinterpret_cast<LPCWSTR>(text.c_str());
 }
 
 }  // namespace
@@ -29,7 +29,16 @@ ncfUInt32 LastError() {
 FileHandle OpenForReading(const std::u16string& path) {
     const HANDLE file = ::CreateFileW(Wide(path), GENERIC_READ, FILE_SHARE_READ, nullptr,
                                       OPEN_EXISTING, FILE_FLAG_NO_BUFFERING, nullptr);
-    return file == INVALID_HANDLE_VALUE ? kNoFile : reinterpret_cast<FileHandle>(file);
+    if (file == INVALID_HANDLE_VALUE) {
+        return kNoFile;
+    }
+    // "CON" and pipes are opened as files are; reading them would wait for somebody.
+    if (::GetFileType(file) != FILE_TYPE_DISK) {
+        ::CloseHandle(file);
+        ::SetLastError(ERROR_INVALID_PARAMETER);
+        return kNoFile;
+    }
+    return reinterpret_cast<FileHandle>(file);
 }
 
 bool Close(FileHandle file) {
@@ -71,7 +80,9 @@ bool Read(FileHandle file, void* buffer, ncfUInt32 size, ncfUInt32* bytesRead) {
 }
 
 void* AllocateAligned(std::size_t size, std::size_t alignment) {
-    return _aligned_malloc(size, alignment);
+    // The C library may end the process over another number.
+    const bool isPowerOfTwo = alignment != 0 && (alignment & (alignment - 1)) == 0;
+    return isPowerOfTwo ? _aligned_malloc(size, alignment) : nullptr;
 }
 
 void FreeAligned(void* memory) {
@@ -111,13 +122,14 @@ bool GetModulePath(const void* address, std::wstring* path) {
                               &module)) {
         return false;
     }
-    wchar_t buffer[260] = {};
-    const DWORD length = ::GetModuleFileNameW(module, buffer, 260);
-    buffer[259] = L'\0';
+    constexpr DWORD kSize = 260;
+    WCHAR buffer[kSize] = {};
+    const DWORD length = ::GetModuleFileNameW(module, buffer, kSize);
     if (length == 0) {
         return false;
     }
-    *path = buffer;
+    // A longer path is cut, and counted with the zero that may be missing.
+    path->assign(buffer, buffer + (length < kSize ? length : kSize - 1));
     return true;
 }
 

@@ -38,6 +38,9 @@ SAMPLES = [
         ("describe", "--jsonl", "in fragmented.mp4 absent.mov --out-dir out", 2),
         ("describe", "--jsonl", "in --out-dir out --skip-done --jobs 2"),
         ("describe", "--jsonl", "bad --bin absent/bin.aaf", 2),
+        ("describe", "--json", "in --against bin.aaf"),
+        ("describe", "--json", "away --against bin.aaf", 1),
+        ("describe", "--json", "bad/text.mov --against bin.aaf", 1),
         ("samples", "--json", "in/h264_with_aac.mov"),
         ("samples", "--json", "in/pcm_u8.mov --every"),
         ("samples", "--json", "bad/cut.mov", 1),
@@ -56,6 +59,9 @@ SAMPLES = [
         ("params", "--json", "bad/text.mov", 1),
         ("dump", "--json", "bin.aaf"),
         ("dump", "--json", "bad/no_aaf.aaf", 1),
+        ("compare", "--json", "bin.aaf bin.aaf"),
+        ("compare", "--json", "bin.aaf mapped.aaf", 1),
+        ("compare", "--json", "bin.aaf bad/no_aaf.aaf", 1),
         ("verify", "--json", "bin.aaf"),
         ("verify", "--json", "mapped.aaf bad/no_aaf.aaf", 1),
         ("verify", "--json", "mapped.aaf --search away", 1),
@@ -74,6 +80,9 @@ SAMPLES = [
         ("find", "--json", "clips.sqlite"),
         ("find", "--json", "clips.sqlite width:>100000", 1),
         ("find", "--json", "bad/no_aaf.aaf", 2),
+        ("report", "--json", "in bad fragmented.mp4 clips.sqlite parts --map in=/nowhere/media", 1),
+        ("report", "--json", "absent.mov --jobs 1", 2),
+        ("report", "--json", "--files-from absent", 2),
         ("types", "--json", ""),
         ("types", "--json", "--plugin absent", 2),
         ("validate", "--json", "bad/no_aaf.aaf", 1),
@@ -81,6 +90,10 @@ SAMPLES = [
         ("validate", "--json", "absent.nvx", 2),
         ("plugin", "--json", ""),
         ("plugin", "--json", "--plugin absent", 2),
+        ("check-data", "--json", ""),
+        ("check-data", "--json", "data", 1),
+        ("check-data", "--json", "empty", 2),
+        ("check-data", "--json", "absent", 2),
     )
 ]
 
@@ -114,6 +127,27 @@ def make_files(movies, types, work):
     (work / "odd/folder.mov").mkdir()
     (work / "empty").mkdir()
     write("away/pcm.mov", bytes_of("pcm_u8.mov"))
+    write("data/FourCharMapper.xml", b"<Map><FourCharMapping FourChar='abc'/></Map>")
+    write("data/AAFInfo.xml", b"<Infos")
+    write("parts/colors.mov", bytes_of("h264_rec709.mov"))
+    (work / "parts").mkdir(exist_ok=True)
+    sources = "-f lavfi -i testsrc2=size=160x90:rate=25 -f lavfi -i sine -t 4 -c:v mjpeg -c:a pcm_s16le".split()
+    for name, options in (("apart", []), ("first", ["-movflags", "+faststart"])):
+        subprocess.run(["ffmpeg", "-nostdin", "-v", "error", *sources, *options, work / f"parts/{name}.mov"], check=True)
+    movie = (work / "parts/apart.mov").read_bytes()
+    write("parts/apart.mov", with_sound_behind(movie))
+    movie = (work / "parts/first.mov").read_bytes()
+    write("parts/first.mov", movie[: len(movie) * 2 // 3])
+
+
+def with_sound_behind(movie):
+    """The movie with a copy of all its bytes behind it, in which its second track has its samples."""
+    at = movie.rindex(b"stco") + 8
+    count = struct.unpack(">I", movie[at : at + 4])[0]
+    places = struct.unpack(f">{count}I", movie[at + 4 : at + 4 + 4 * count])
+    moved = struct.pack(f">{count}I", *(place + len(movie) for place in places))
+    copy = struct.pack(">I4s", len(movie), b"free") + movie[8:]
+    return movie[: at + 4] + moved + movie[at + 4 + 4 * count :] + copy
 
 
 def with_size(movie, code, pixels):

@@ -4,7 +4,9 @@
 
 #include <gtest/gtest.h>
 
+#include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/Failure.h"
+#include "tests/support/TestFolder.h"
 
 using namespace cliphost;
 
@@ -38,6 +40,16 @@ TEST(MovieColumns, FindsByPathThenByName) {
     EXPECT_EQ(RowOf(columns, "/there/e.mov"), 0u);
     EXPECT_EQ(RowOf(columns, "/m/f.mov"), 8u);
     EXPECT_EQ(RowOf(columns, "/m/A.mov"), 0u);
+}
+
+TEST(MovieColumns, FindsByPathsBehindLinks) {
+    const TestFolder folder;
+    std::filesystem::create_directories(folder.path() / "a/b");
+    std::filesystem::create_directory_symlink("a/b", folder.path() / "link");
+    const std::string path = folder.path() / "link/../c.mov";
+    const MovieColumns columns("t.csv", "path,Scene\n" + CsvLine({path, "1"}));
+    EXPECT_EQ(RowOf(columns, (folder.path() / "a/c.mov").c_str()), 2u);
+    EXPECT_EQ(RowOf(columns, (folder.path() / "c.mov").c_str()), 0u);
 }
 
 // With a path the name is the clip's; where a row has none, it says which movie.

@@ -7,6 +7,8 @@
 #include <filesystem>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/util/text/FileUrl.h"
+#include "tests/support/TestFolder.h"
 
 using cliphost::PathMaps;
 
@@ -62,6 +64,14 @@ TEST(PathMaps, TakeAFolderFromTheWorkingFolder) {
     const std::string here = std::filesystem::current_path();
     EXPECT_EQ(ToOther("a/../b=/x", "file://" + here + "/b/c.mov"), "file:///x/c.mov");
     EXPECT_EQ(ToOther(".=/x", "file://" + here + "/c.mov"), "file:///x/c.mov");
+    // As the module is given it.
+    const TestFolder folder;
+    std::filesystem::create_directories(folder.path() / "a/b");
+    std::filesystem::create_directory_symlink("a/b", folder.path() / "link");
+    const auto fromHere = folder.path().lexically_relative(here);
+    EXPECT_EQ(ToOther((fromHere / "link/..").string() + "=/x",
+                      host::text::FileUrl((folder.path() / "a/c.mov").native())),
+              "file:///x/c.mov");
 }
 
 TEST(PathMaps, TakeFoldersHoweverTheyAreWritten) {

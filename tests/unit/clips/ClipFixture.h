@@ -9,12 +9,12 @@
 #include <fstream>
 #include <memory>
 #include <string>
-#include <tr1/memory>
 #include <vector>
 
 #include "host_interfaces/framework/HostSettings.h"
 #include "host_interfaces/util/NMAUtil.h"
 #include "source/clips/QuickTimeClip.h"
+#include "source/plugin/Tr1Memory.h"
 #include "tests/support/TestFolder.h"
 #include "tests/support/fakes/FakeHost.h"
 #include "tests/support/fakes/RecordingLogger.h"

@@ -5,10 +5,10 @@
 #include <gtest/gtest.h>
 
 #include <string>
-#include <tr1/memory>
 
 #include "host_interfaces/framework/EditorSettings.h"
 #include "source/plugin/CNCFUnknown.h"
+#include "source/plugin/Tr1Memory.h"
 #include "tests/support/fakes/FakeHost.h"
 #include "tests/support/fakes/RecordingLogger.h"
 #include "tests/unit/aaf/support/FakeClip.h"

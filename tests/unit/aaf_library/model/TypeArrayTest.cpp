@@ -56,6 +56,18 @@ TEST_F(ArrayTypes, ElementsOfAnotherKindAreRefused) {
     EXPECT_EQ(tagged->AppendElement(Empty(tagged).get(), Int32Value(1).get()), AAFRESULT_BAD_TYPE);
 }
 
+// Before anything is asked of the other.
+TEST_F(ArrayTypes, ListAndElementAreBothNeeded) {
+    const auto list = Empty(numbers);
+    const auto element = Int32Value(1);
+    EXPECT_EQ(numbers->AppendElement(nullptr, element.get()), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(numbers->AppendElement(list.get(), nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(numbers->AppendElement(nullptr, nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(numbers->AppendElement(element.get(), nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(numbers->SetElementValue(element.get(), 0, nullptr), AAFRESULT_NULL_PARAM);
+    EXPECT_EQ(Count(numbers, list), 0u);
+}
+
 TEST_F(ArrayTypes, WholeArraysHaveToBeMultiplesOfTheElement) {
     aafInt32 three[3] = {1, 2, 3};
     IAAFPropertyValue* out = nullptr;

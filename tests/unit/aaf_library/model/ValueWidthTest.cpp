@@ -46,6 +46,18 @@ TEST_F(ValueWidth, ChangesOfNumbersKeepTheirSign) {
     EXPECT_EQ((Bytes{7, 0, 0, 0}), Widened(kAAFTypeID_ColorSitingType, {7}, kAAFTypeID_UInt32));
 }
 
+TEST_F(ValueWidth, ChangesOfEachElementOfAnArray) {
+    EXPECT_EQ((Bytes{1, 0, 0, 0, 0xFF, 0, 0, 0}),
+              Widened(kAAFTypeID_UInt8Array, {1, 0xFF}, kAAFTypeID_Int32Array));
+    EXPECT_EQ((Bytes{1, 0xFF}),
+              Widened(kAAFTypeID_Int32Array, {1, 0, 0, 0, 0xFF, 0, 0, 0}, kAAFTypeID_UInt8Array));
+    EXPECT_EQ(Bytes{}, Widened(kAAFTypeID_UInt8Array, {}, kAAFTypeID_Int32Array));
+    EXPECT_EQ(std::nullopt, Widened(kAAFTypeID_Int32Array, {0x2C, 1, 0, 0}, kAAFTypeID_UInt8Array));
+    EXPECT_EQ(std::nullopt, Widened(kAAFTypeID_Int32Array, {1, 0, 0}, kAAFTypeID_UInt8Array));
+    EXPECT_EQ(std::nullopt, Widened(kAAFTypeID_UInt8Array, {1}, kAAFTypeID_Int32));
+    EXPECT_EQ(std::nullopt, Widened(kAAFTypeID_UInt8, {1}, kAAFTypeID_Int32Array));
+}
+
 TEST_F(ValueWidth, DoesNotChangeWhereAValueWouldNotFit) {
     EXPECT_EQ(std::nullopt, Widened(kAAFTypeID_UInt16, {0x2C, 0x01}, kAAFTypeID_UInt8));
     EXPECT_EQ(std::nullopt, Widened(kAAFTypeID_UInt8, {0xFF}, kAAFTypeID_Int8));

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <functional>
 
+#include "aaf_library/model/PropertyKeys.h"
 #include "tests/unit/aaf_library/objects/SavedFile.h"
 
 // Definitions of plug-ins, codecs and KLV data, and the sets of ids in header and clips.
@@ -214,6 +215,18 @@ TEST_F(Definition, OfACodecForgetsAKind) {
     Ptr<IAAFDataDef> left =
         Get(Get(codec, &IAAFCodecDef::GetEssenceKinds), &IEnumAAFDataDefs::NextOne);
     EXPECT_EQ(sound.get(), left.get());
+    // One of another file that has the same id is the same kind.
+    Ptr<IAAFFile> other;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, other.Out()));
+    Ptr<IAAFDataDef> theirs = Get(Get(other, &IAAFFile::GetDictionary),
+                                  &IAAFDictionary::LookupDataDef, kAAFDataDef_LegacySound);
+    aafBoolean_t isSupported = kAAFFalse;
+    EXPECT_EQ(AAFRESULT_SUCCESS, codec->IsEssenceKindSupported(theirs, &isSupported));
+    EXPECT_EQ(kAAFTrue, isSupported);
+    EXPECT_EQ(AAFRESULT_SUCCESS, codec->RemoveEssenceKind(theirs));
+    EXPECT_EQ(0u, Get(codec, &IAAFCodecDef::CountEssenceKinds));
+    EXPECT_EQ(AAFRESULT_SUCCESS, codec->IsEssenceKindSupported(theirs, &isSupported));
+    EXPECT_EQ(kAAFFalse, isSupported);
 }
 
 TEST_F(Definition, OfKLVDataHasAType) {
@@ -226,6 +239,110 @@ TEST_F(Definition, OfKLVDataHasAType) {
     Ptr<IAAFTypeDef> bytes = Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_UInt8);
     EXPECT_EQ(AAFRESULT_SUCCESS, data->SetKLVDataType(bytes));
     EXPECT_EQ(bytes.get(), Get(data, &IAAFKLVDataDefinition::GetKLVDataType).get());
+}
+
+// Definitions that nothing refers to stay in a file that is saved in place.
+TEST_F(Definition, OfACodecAndOfKLVDataAreStored) {
+    const std::u32string name = (folder_ / "own.aaf").u32string();
+    const std::wstring path{name.begin(), name.end()};
+    Ptr<IAAFFile> file;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              AAFFileOpenNewModify(path.c_str(), 0, &product_.ident, file.Out()));
+    {
+        Ptr<IAAFDictionary> dictionary = Get(file, &IAAFFile::GetDictionary);
+        Ptr<IAAFCodecDef> codec;
+        ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->CreateInstance(AUID_AAFCodecDef, IID_IAAFCodecDef,
+                                                                codec.OutUnknown()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, codec->Initialize(kOne, L"Codec", L""));
+        for (const aafUID_t& id : {kAAFDataDef_LegacyPicture, kAAFDataDef_LegacySound}) {
+            EXPECT_EQ(AAFRESULT_SUCCESS,
+                      codec->AddEssenceKind(Get(dictionary, &IAAFDictionary::LookupDataDef, id)));
+        }
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  codec->RemoveEssenceKind(
+                      Get(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_LegacyPicture)));
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  codec->SetFileDescriptorClass(
+                      Get(dictionary, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor)));
+        ASSERT_EQ(AAFRESULT_SUCCESS, dictionary->RegisterCodecDef(codec));
+        Ptr<IAAFKLVDataDefinition> data;
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  dictionary->CreateInstance(AUID_AAFKLVDataDefinition, IID_IAAFKLVDataDefinition,
+                                             data.OutUnknown()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, data->Initialize(kTwo, L"Data", L""));
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  data->SetKLVDataType(
+                      Get(dictionary, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational)));
+        ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFDictionary2>(dictionary)->RegisterKLVDataDef(data));
+    }
+    ASSERT_EQ(AAFRESULT_SUCCESS, file->Save());
+    ASSERT_EQ(AAFRESULT_SUCCESS, file->Close());
+    Ptr<IAAFFile> read;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenExistingRead(path.c_str(), 0, read.Out()));
+    Ptr<IAAFDictionary> dictionary = Get(read, &IAAFFile::GetDictionary);
+    Ptr<IAAFCodecDef> codec = Get(dictionary, &IAAFDictionary::LookupCodecDef, kOne);
+    ASSERT_EQ(1u, Get(codec, &IAAFCodecDef::CountEssenceKinds));
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::LookupDataDef, kAAFDataDef_LegacySound).get(),
+              Get(Get(codec, &IAAFCodecDef::GetEssenceKinds), &IEnumAAFDataDefs::NextOne).get());
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor).get(),
+              Get(codec, &IAAFCodecDef::GetFileDescriptorClass).get());
+    Ptr<IAAFKLVDataDefinition> data =
+        Get(As<IAAFDictionary2>(dictionary), &IAAFDictionary2::LookupKLVDataDef, kTwo);
+    EXPECT_EQ(Get(dictionary, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational).get(),
+              Get(data, &IAAFKLVDataDefinition::GetKLVDataType).get());
+}
+
+// The class of descriptors that a codec serves may be one that only its file knows.
+TEST_F(Definition, OfACodecIsClonedWithItsClass) {
+    Ptr<IAAFClassDef> own;
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->CreateMetaInstance(AUID_AAFClassDef, IID_IAAFClassDef,
+                                                                 own.OutUnknown()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              own->Initialize(
+                  kTwo, Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFCDCIDescriptor),
+                  L"OwnDescriptor", kAAFTrue));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterClassDef(own));
+    Ptr<IAAFCodecDef> codec = Make<IAAFCodecDef>(AUID_AAFCodecDef);
+    ASSERT_EQ(AAFRESULT_SUCCESS, codec->Initialize(kOne, L"Codec", L""));
+    ASSERT_EQ(AAFRESULT_SUCCESS, codec->SetFileDescriptorClass(own));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterCodecDef(codec));
+    Ptr<IAAFMob> mob = FileMob(1);
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFFileDescriptor>(Get(As<IAAFSourceMob>(mob),
+                                                            &IAAFSourceMob::GetEssenceDescriptor))
+                                     ->SetCodecDef(codec));
+
+    Ptr<IAAFFile> target;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, target.Out()));
+    Ptr<IAAFMob> clone;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              mob->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, target, clone.Out()));
+    Ptr<IAAFDictionary> there = Get(target, &IAAFFile::GetDictionary);
+    Ptr<IAAFCodecDef> found = Get(there, &IAAFDictionary::LookupCodecDef, kOne);
+    EXPECT_EQ(Get(there, &IAAFDictionary::LookupClassDef, kTwo).get(),
+              Get(found, &IAAFCodecDef::GetFileDescriptorClass).get());
+}
+
+// A codec and an operation may have one id: each stands in a set of its own.
+TEST_F(Definition, OfOneKindMayHaveTheIdOfAnother) {
+    Ptr<IAAFOperationDef> effect = Make<IAAFOperationDef>(AUID_AAFOperationDef);
+    ASSERT_EQ(AAFRESULT_SUCCESS, effect->Initialize(kOne, L"Effect", L""));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterOperationDef(effect));
+    Ptr<IAAFParameterDef> parameter = Make<IAAFParameterDef>(AUID_AAFParameterDef);
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              parameter->Initialize(
+                  kOne, L"Parameter", L"",
+                  Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterParameterDef(parameter));
+    ASSERT_EQ(AAFRESULT_SUCCESS, effect->AddParameterDef(parameter));
+    Ptr<IAAFOperationGroup> group = Make<IAAFOperationGroup>(AUID_AAFOperationGroup);
+    ASSERT_EQ(AAFRESULT_SUCCESS, group->Initialize(DataDef(kAAFDataDef_LegacyPicture), 10, effect));
+    AddComposition(group);
+    Ptr<IAAFOperationGroup> read = ReopenedSegment<IAAFOperationGroup>();
+    Ptr<IAAFOperationDef> found = Get(read, &IAAFOperationGroup::GetOperationDefinition);
+    EXPECT_EQ(L"Parameter",
+              TextOf<IAAFDefObject>(
+                  As<IAAFDefObject>(Get(found, &IAAFOperationDef::LookupParameterDef, kOne)).get(),
+                  &IAAFDefObject::GetNameBufLen, &IAAFDefObject::GetName));
 }
 
 class SetOfIds : public SavedFile {};
@@ -351,6 +468,62 @@ TEST_F(SetOfIds, OfDescribedSlotsIsStoredInOrder) {
     EXPECT_EQ(AAFRESULT_SUCCESS, clip->RemoveDescribedSlotID(2));
     EXPECT_EQ(AAFRESULT_SUCCESS, clip->RemoveDescribedSlotID(300));
     EXPECT_EQ(0u, Get(clip, &IAAFDescriptiveClip::CountDescribedSlotIDs));
+}
+
+TEST_F(SetOfIds, OfAMarkersSlotsHasEachOnceAndInOrder) {
+    Ptr<IAAFDescriptiveMarker> marker = Make<IAAFDescriptiveMarker>(AUID_AAFDescriptiveMarker);
+    aafUInt32 slots[] = {300, 2, 300, 7};
+    EXPECT_EQ(AAFRESULT_NULL_PARAM, marker->SetDescribedSlotIDs(4, nullptr));
+    EXPECT_EQ(AAFRESULT_SUCCESS, marker->SetDescribedSlotIDs(4, slots));
+    ASSERT_EQ(3u, Get(marker, &IAAFDescriptiveMarker::GetDescribedSlotIDsSize));
+    aafUInt32 found[3] = {};
+    EXPECT_EQ(AAFRESULT_SMALLBUF, marker->GetDescribedSlotIDs(2, found));
+    EXPECT_EQ(0u, found[0]);
+    EXPECT_EQ(AAFRESULT_SUCCESS, marker->GetDescribedSlotIDs(3, found));
+    EXPECT_EQ((std::vector<aafUInt32>{2, 7, 300}), std::vector<aafUInt32>(found, found + 3));
+}
+
+TEST_F(SetOfIds, OfEssenceContainersNeedsAContent) {
+    Ptr<IAAFObject> header = As<IAAFObject>(header_);
+    Ptr<IAAFPropertyDef> content =
+        Get(Get(header, &IAAFObject::GetDefinition), &IAAFClassDef::LookupPropertyDef,
+            aaf::prop::Header_Content.id);
+    ASSERT_EQ(AAFRESULT_SUCCESS, header->RemoveOptionalProperty(content));
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_FOUND, As<IAAFHeader2>(header_)->UpdateEssenceContainers());
+}
+
+// What the header tells of the content goes where the content goes.
+TEST_F(SetOfIds, GoAlongWithACopyOfTheFile) {
+    const auto fill = [](IAAFHeader* header, const aafUID_t& scheme) {
+        Ptr<IAAFHeader2> filled = As<IAAFHeader2>(header);
+        EXPECT_EQ(AAFRESULT_SUCCESS, filled->AddDescriptiveScheme(scheme));
+        EXPECT_EQ(AAFRESULT_SUCCESS, filled->SetOperationalPattern(kTwo));
+    };
+    Ptr<IAAFMob> mob = FileMob(1);
+    ASSERT_EQ(
+        AAFRESULT_SUCCESS,
+        As<IAAFFileDescriptor>(Get(As<IAAFSourceMob>(mob), &IAAFSourceMob::GetEssenceDescriptor))
+            ->SetContainerFormat(Get(Get(dictionary_, &IAAFDictionary::GetContainerDefs),
+                                     &IEnumAAFContainerDefs::NextOne)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
+    EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFHeader2>(header_)->UpdateEssenceContainers());
+    fill(header_, kThree);
+    Ptr<IAAFHeader2> written = As<IAAFHeader2>(Reopen());
+    // Into a file that its caller has begun to fill.
+    Ptr<IAAFFile> begun;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, begun.Out()));
+    fill(Get(begun, &IAAFFile::GetHeader), kOne);
+    ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(begun));
+    Ptr<IAAFHeader2> copied = As<IAAFHeader2>(Get(begun, &IAAFFile::GetHeader));
+    for (const Ptr<IAAFHeader2>& header : {written, copied}) {
+        EXPECT_EQ(kTwo, Get(header, &IAAFHeader2::GetOperationalPattern));
+        EXPECT_EQ(1u, Get(header, &IAAFHeader2::CountEssenceContainers));
+        aafBoolean_t present = kAAFFalse;
+        EXPECT_EQ(AAFRESULT_SUCCESS, header->IsDescriptiveSchemePresent(kThree, &present));
+        EXPECT_EQ(kAAFTrue, present);
+    }
+    EXPECT_EQ(1u, Get(written, &IAAFHeader2::CountDescriptiveSchemes));
+    EXPECT_EQ(2u, Get(copied, &IAAFHeader2::CountDescriptiveSchemes));
 }
 
 }  // namespace aaf_test

@@ -277,6 +277,9 @@ TEST_F(Descriptor, OfSamplesNeedsItsOwnInitialize) {
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetCompression({}));
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetIsLocked(kAAFTrue));
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetElectroSpatialFormulation(1));
+    // Odd members of an enumeration come before all else.
+    EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, sound->SetIsLocked(2));
+    EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE, sound->SetElectroSpatialFormulation(5));
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetAudioRefLevel(1));
     EXPECT_EQ(AAFRESULT_NOT_INITIALIZED, sound->SetDialNorm(1));
     EXPECT_EQ(0u, Get(sound, &IAAFSoundDescriptor::GetChannelCount));

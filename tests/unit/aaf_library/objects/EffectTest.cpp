@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "aaf_library/model/PropertyKeys.h"
 #include "tests/unit/aaf_library/objects/SavedFile.h"
 
 // Effects: their definitions in the dictionary, and their use in a composition.
@@ -191,6 +192,32 @@ TEST_F(Effect, DefinitionOrdersItsParameters) {
     }
 }
 
+// A caller who sets them as a value may have them in any order.
+TEST_F(Effect, DefinitionHasEachParameterOnce) {
+    Ptr<IAAFOperationDef> blend = Registered(kBlend, L"Blend");
+    Ptr<IAAFObject> object = As<IAAFObject>(blend);
+    Ptr<IAAFPropertyDef> all =
+        Get(Get(object, &IAAFObject::GetDefinition), &IAAFClassDef::LookupPropertyDef,
+            aaf::prop::OperationDefinition_ParametersDefined.id);
+    Ptr<IAAFTypeDefSet> set = As<IAAFTypeDefSet>(Get(all, &IAAFPropertyDef::GetTypeDef));
+    Ptr<IAAFTypeDefObjectRef> reference =
+        As<IAAFTypeDefObjectRef>(Get(set, &IAAFTypeDefSet::GetElementType));
+    Ptr<IAAFPropertyValue> value;
+    ASSERT_EQ(AAFRESULT_SUCCESS, object->CreateOptionalPropertyValue(all, value.Out()));
+    for (const aafUID_t& id : {kLevel, kSoftness}) {
+        Ptr<IAAFPropertyValue> element;
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  reference->CreateValue(RegisteredParameter(id), element.Out()));
+        ASSERT_EQ(AAFRESULT_SUCCESS, set->AddElement(value, element));
+    }
+    for (const aafUID_t& id : {kLevel, kSoftness}) {
+        EXPECT_EQ(
+            AAFRESULT_OBJECT_ALREADY_ATTACHED,
+            blend->AddParameterDef(Get(dictionary_, &IAAFDictionary::LookupParameterDef, id)));
+    }
+    EXPECT_EQ(2u, Get(blend, &IAAFOperationDef::CountParameterDefs));
+}
+
 TEST_F(Effect, GroupKnowsWhatItsDefinitionSays) {
     Ptr<IAAFOperationDef> blend = Registered(kBlend, L"Blend");
     Ptr<IAAFOperationGroup> group = Group(blend);
@@ -348,6 +375,57 @@ TEST_F(Effect, VaryingValueChecksItsArguments) {
     EXPECT_EQ(AAFRESULT_SUCCESS, point->SetValue(sizeof half, BytesOf(half)));
 }
 
+TEST_F(Effect, ValueThatIsRefusedStaysAsItWas) {
+    Ptr<IAAFParameterDef> level = RegisteredParameter(kLevel);
+    aafRational_t half{1, 2};
+    Ptr<IAAFConstantValue> constant = Make<IAAFConstantValue>(AUID_AAFConstantValue);
+    EXPECT_EQ(AAFRESULT_ILLEGAL_VALUE, constant->Initialize(level, 3, BytesOf(half)));
+    Ptr<IAAFVaryingValue> varying = Make<IAAFVaryingValue>(AUID_AAFVaryingValue);
+    EXPECT_EQ(AAFRESULT_OBJECT_NOT_ATTACHED, varying->Initialize(level, FreeLinear()));
+    for (const Ptr<IAAFParameter>& value :
+         {As<IAAFParameter>(constant), As<IAAFParameter>(varying)}) {
+        Ptr<IAAFParameterDef> none;
+        EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, value->GetParameterDefinition(none.Out()));
+    }
+}
+
+// The list may change while it is gone through, as any other.
+TEST_F(Effect, ListOfDefinitionsIsGoneThroughAsItIs) {
+    Ptr<IAAFOperationDef> blend = Registered(kBlend, L"Blend");
+    for (const aafUID_t& id : {kCut, kWipe}) {
+        ASSERT_EQ(AAFRESULT_SUCCESS, blend->AppendDegradeToOperation(Registered(id, L"Other")));
+    }
+    ASSERT_EQ(AAFRESULT_SUCCESS, blend->AppendDegradeToOperation(blend));
+    using I = IEnumAAFOperationDefs;
+    Ptr<I> all = Get(blend, &IAAFOperationDef::GetDegradeToOperations);
+    const auto next = [](I* from) {
+        return Get(As<IAAFDefObject>(Get(from, &I::NextOne)), &IAAFDefObject::GetAUID);
+    };
+    EXPECT_EQ(kCut, next(all));
+    Ptr<I> second = Get(all, &I::Clone);
+    EXPECT_EQ(kWipe, next(all));
+    EXPECT_EQ(kWipe, next(second));
+    EXPECT_EQ(AAFRESULT_SUCCESS, all->Reset());
+    EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, all->Skip(4));
+    EXPECT_EQ(AAFRESULT_SUCCESS, all->Skip(2));
+    EXPECT_EQ(kBlend, next(all));
+    // Without the first one the second stands at the end.
+    EXPECT_EQ(AAFRESULT_SUCCESS, blend->RemoveDegradeToOperationAt(0));
+    Ptr<IAAFOperationDef> none;
+    EXPECT_EQ(AAFRESULT_NO_MORE_OBJECTS, second->NextOne(none.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, blend->AppendDegradeToOperation(blend));
+    EXPECT_EQ(kBlend, next(second));
+    // The last reference may go; the empty list is stored.
+    for (int left = 0; left < 3; ++left) {
+        EXPECT_EQ(AAFRESULT_SUCCESS, blend->RemoveDegradeToOperationAt(0));
+    }
+    EXPECT_EQ(AAFRESULT_BADINDEX, blend->RemoveDegradeToOperationAt(0));
+    AddComposition(Group(blend));
+    Ptr<IAAFOperationGroup> read = ReopenedSegment<IAAFOperationGroup>();
+    EXPECT_EQ(0u, Get(Get(read, &IAAFOperationGroup::GetOperationDefinition),
+                      &IAAFOperationDef::CountDegradeToOperations));
+}
+
 TEST_F(Effect, VaryingValueOfATypeWithoutSizeHasNoLength) {
     Ptr<IAAFVaryingValue> value = Make<IAAFVaryingValue>(AUID_AAFVaryingValue);
     Ptr<IAAFParameterDef> text = ParameterOf(kNowhere, kAAFTypeID_String);
@@ -355,6 +433,36 @@ TEST_F(Effect, VaryingValueOfATypeWithoutSizeHasNoLength) {
     ASSERT_EQ(AAFRESULT_SUCCESS, value->Initialize(text, Linear()));
     aafInt32 size = 0;
     EXPECT_EQ(AAFRESULT_BAD_TYPE, value->GetValueBufLen(&size));
+}
+
+// The type that a parameter has may be one that only its file knows.
+TEST_F(Effect, CloneTakesTheTypeOfItsParameterAlong) {
+    Ptr<IAAFTypeDefRename> own;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              dictionary_->CreateMetaInstance(AUID_AAFTypeDefRename, IID_IAAFTypeDefRename,
+                                              own.OutUnknown()));
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              own->Initialize(kNowhere,
+                              Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Rational),
+                              L"Loudness"));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterTypeDef(As<IAAFTypeDef>(own)));
+    Ptr<IAAFOperationDef> blend = Registered(kBlend, L"Blend");
+    Ptr<IAAFParameterDef> loudness = ParameterOf(kLevel, kNowhere);
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterParameterDef(loudness));
+    ASSERT_EQ(AAFRESULT_SUCCESS, blend->AddParameterDef(loudness));
+    AddComposition(Group(blend));
+
+    Ptr<IAAFFile> target;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, target.Out()));
+    Ptr<IAAFMob> clone;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              Get(header_, &IAAFHeader::LookupMob, MobId(0xC0))
+                  ->CloneExternal(kAAFNoFollowDepend, kAAFNoIncludeMedia, target, clone.Out()));
+    Ptr<IAAFDictionary> there = Get(target, &IAAFFile::GetDictionary);
+    Ptr<IAAFParameterDef> found = Get(there, &IAAFDictionary::LookupParameterDef, kLevel);
+    EXPECT_EQ(Get(there, &IAAFDictionary::LookupTypeDef, kNowhere).get(),
+              Get(found, &IAAFParameterDef::GetTypeDefinition).get());
+    EXPECT_EQ(AAFRESULT_SUCCESS, target->Save());
 }
 
 }  // namespace aaf_test

@@ -17,6 +17,7 @@
 #include "host_interfaces/aaf/AAFTypeDefinitions.h"
 #include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/objects/ClipDescription.h"
+#include "tests/unit/aaf_library/objects/Sentences.h"
 
 namespace aaf_test {
 
@@ -27,24 +28,6 @@ using aaf::stored::StoredProperty;
 namespace prop = aaf::prop;
 
 namespace {
-
-// Sentences that the library tells while this lives.
-class Sentences final : public IAAFDiagnosticOutput {
-public:
-    Sentences() { AAFSetDiagnosticOutput(this); }
-    ~Sentences() { AAFSetDiagnosticOutput(nullptr); }
-    Sentences(const Sentences&) = delete;
-    Sentences& operator=(const Sentences&) = delete;
-    HRESULT QueryInterface(REFIID, void**) override { return AAFRESULT_NOT_IMPLEMENTED; }
-    ULONG AddRef() override { return 1; }
-    ULONG Release() override { return 1; }
-    HRESULT PutString(aafCharacter_constptr sentence) override {
-        all.emplace_back(sentence);
-        return AAFRESULT_SUCCESS;
-    }
-
-    std::vector<std::wstring> all;
-};
 
 StoredProperty& PropertyIn(StoredObject& object, aaf::PropertyId pid) {
     for (StoredProperty& property : object.properties) {
@@ -270,6 +253,46 @@ TEST_F(ForeignFile, ShowsAnOddPropertyAsBytesOfNoDefinedType) {
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetName(text, sizeof text));
     value = Get(object, &IAAFObject::GetPropertyValue, name);
     EXPECT_EQ(kAAFTrue, Get(value, &IAAFPropertyValue::IsDefinedType));
+}
+
+// Looking at essence that can't be read doesn't lose it.
+TEST_F(ForeignFile, KeepsEssenceOfAnOddFormThatIsLookedAt) {
+    Ptr<IAAFMob> described = Get(header_, &IAAFHeader::LookupMob, MobId(0xB1));
+    Ptr<IAAFEssenceData> made = Make<IAAFEssenceData>(AUID_AAFEssenceData);
+    ASSERT_EQ(AAFRESULT_SUCCESS, made->Initialize(As<IAAFSourceMob>(described)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddEssenceData(made));
+    aafUInt8 byte = 1;
+    aafUInt32 count = 0;
+    ASSERT_EQ(AAFRESULT_SUCCESS, made->Write(1, &byte, &count));
+    SaveAs(file_, "essence.aaf");
+    const auto dataIn = [](StoredObject& root) -> StoredProperty& {
+        StoredObject& header = root.properties.at(1).objects.at(0);
+        StoredObject& content = PropertyIn(header, prop::Header_Content.pid).objects.at(0);
+        StoredProperty& all = PropertyIn(content, prop::ContentStorage_EssenceData.pid);
+        return PropertyIn(all.objects.at(0), prop::EssenceData_Data.pid);
+    };
+    StoredObject root = Tree("essence.aaf");
+    StoredProperty odd;
+    odd.pid = prop::EssenceData_Data.pid;
+    odd.form = StoredForm(0x40);
+    odd.bytes = {1, 2, 3};
+    dataIn(root) = odd;
+    WriteTree(root, "odd.aaf");
+    const Sentences told;
+    Ptr<IAAFFile> read = Open("odd.aaf");
+    Ptr<IAAFEssenceData> data =
+        Get(Get(read, &IAAFFile::GetHeader), &IAAFHeader::LookupEssenceData, MobId(0xB1));
+    aafLength_t size = 0;
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, data->GetSize(&size));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, data->GetPosition(&size));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, data->SetPosition(0));
+    EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, data->Read(1, &byte, &count));
+    SaveAs(read, "copy.aaf");
+    StoredObject copied = Tree("copy.aaf");
+    EXPECT_EQ(odd.bytes, dataIn(copied).bytes);
+    // What is written takes its place.
+    EXPECT_EQ(AAFRESULT_SUCCESS, data->Write(1, &byte, &count));
+    EXPECT_EQ(1, Get(data, &IAAFEssenceData::GetSize));
 }
 
 }  // namespace aaf_test

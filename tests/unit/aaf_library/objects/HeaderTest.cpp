@@ -215,6 +215,28 @@ TEST_F(Header, RefusesCriteriaThatItDoesNotKnow) {
     EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED, header_->GetMobs(&criterion, mobs.Out()));
 }
 
+TEST_F(Header, FindsEssenceByTheMobThatItIsGiven) {
+    Ptr<IAAFEssenceData> data[3];
+    for (aafUInt8 number : {1, 2, 3}) {
+        ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(FileMob(number)));
+    }
+    const auto mob = [this](aafUInt8 number) {
+        return As<IAAFSourceMob>(Get(header_, &IAAFHeader::LookupMob, MobId(number)));
+    };
+    for (aafUInt8 number : {1, 2}) {
+        data[number] = Make<IAAFEssenceData>(AUID_AAFEssenceData);
+        ASSERT_EQ(AAFRESULT_SUCCESS, data[number]->Initialize(mob(number)));
+        ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddEssenceData(data[number]));
+    }
+    EXPECT_EQ(AAFRESULT_DUPLICATE_MOBID, data[1]->SetFileMob(mob(2)));
+    EXPECT_EQ(AAFRESULT_SUCCESS, data[1]->SetFileMob(mob(1)));
+    EXPECT_EQ(AAFRESULT_SUCCESS, data[1]->SetFileMob(mob(3)));
+    EXPECT_EQ(data[1].get(), Get(header_, &IAAFHeader::LookupEssenceData, MobId(3)).get());
+    EXPECT_EQ(data[2].get(), Get(header_, &IAAFHeader::LookupEssenceData, MobId(2)).get());
+    Ptr<IAAFEssenceData> none;
+    EXPECT_EQ(AAFRESULT_ESSENCE_NOT_FOUND, header_->LookupEssenceData(MobId(1), none.Out()));
+}
+
 TEST_F(Header, TellsWhoWroteTheFile) {
     Ptr<IAAFIdentification> last = Get(header_, &IAAFHeader::GetLastIdentification);
     EXPECT_EQ(L"Cliphost",

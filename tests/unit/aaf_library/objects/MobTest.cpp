@@ -409,4 +409,79 @@ TEST_F(Mob, AnswersNotImplementedToAccessOfEssence) {
     EXPECT_EQ(AAFRESULT_NOT_IMPLEMENTED, master->CountChannels(1, nullptr, nullptr, &channels));
 }
 
+// The second of two mobs has a property whose id another class of the target has.
+TEST_F(Mob, IsClonedWithAllThatItNeedsOrNotAtAll) {
+    const aafUID_t own = ncfGuid("ABCDEF00-0000-0000-0000-000000000014");
+    const auto add = [&](IAAFDictionary* dictionary, const aafUID_t& classId) {
+        Ptr<IAAFPropertyDef> made;
+        EXPECT_EQ(
+            AAFRESULT_SUCCESS,
+            Get(dictionary, &IAAFDictionary::LookupClassDef, classId)
+                ->RegisterOptionalPropertyDef(
+                    own, L"Own", Get(dictionary, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Int32),
+                    made.Out()));
+        return made;
+    };
+    Ptr<IAAFMob> file = FileMob(2);
+    Ptr<IAAFPropertyValue> value;
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFObject>(file)->CreateOptionalPropertyValue(
+                                     add(dictionary_, AUID_AAFMob), value.Out()));
+    Ptr<IAAFMob> other = FileMob(1);
+    Ptr<IAAFSourceMob> source = As<IAAFSourceMob>(other);
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              source->NewPhysSourceRef({25, 1}, 2, DataDef(kAAFDataDef_LegacyPicture),
+                                       {MobId(2), 1, 0}, 10));
+    Ptr<IAAFEssenceData> essence = Make<IAAFEssenceData>(AUID_AAFEssenceData);
+    ASSERT_EQ(AAFRESULT_SUCCESS, essence->Initialize(source));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(file));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(other));
+    ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddEssenceData(essence));
+
+    Ptr<IAAFFile> target;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, target.Out()));
+    add(Get(target, &IAAFFile::GetDictionary), AUID_AAFComponent);
+    Ptr<IAAFHeader> header = Get(target, &IAAFFile::GetHeader);
+    Ptr<IAAFMob> clone;
+    aafNumSlots_t mobs = 0;
+    EXPECT_EQ(AAFRESULT_INTERNAL_ERROR,
+              other->CloneExternal(kAAFFollowDepend, kAAFIncludeMedia, target, clone.Out()));
+    EXPECT_EQ(AAFRESULT_SUCCESS, header->CountMobs(kAAFAllMob, &mobs));
+    EXPECT_EQ(0u, mobs);
+    EXPECT_EQ(0u, Get(header, &IAAFHeader::CountEssenceData));
+    // Alone it can be had.
+    EXPECT_EQ(AAFRESULT_SUCCESS,
+              other->CloneExternal(kAAFNoFollowDepend, kAAFIncludeMedia, target, clone.Out()));
+    EXPECT_EQ(1u, Get(header, &IAAFHeader::CountEssenceData));
+}
+
+// However long the way, it takes no more stack.
+TEST_F(Mob, IsClonedWithAllMobsOfALongWay) {
+    constexpr std::uint32_t kMobs = 15000;
+    const auto idOf = [](std::uint32_t number) {
+        aafMobID_t id = MobId(1);
+        id.SMPTELabel[1] = static_cast<aafUInt8>(number >> 8);
+        id.SMPTELabel[2] = static_cast<aafUInt8>(number);
+        return id;
+    };
+    Ptr<IAAFDataDef> picture = DataDef(kAAFDataDef_LegacyPicture);
+    for (std::uint32_t number = 0; number < kMobs; ++number) {
+        Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFMasterMob);
+        ASSERT_EQ(AAFRESULT_SUCCESS, mob->SetMobID(idOf(number)));
+        // The last one leads back to the first.
+        ASSERT_EQ(AAFRESULT_SUCCESS,
+                  As<IAAFMasterMob>(mob)->NewPhysSourceRef({25, 1}, 1, picture,
+                                                           {idOf((number + 1) % kMobs), 1, 0}, 10));
+        ASSERT_EQ(AAFRESULT_SUCCESS, header_->AddMob(mob));
+    }
+    Ptr<IAAFFile> target;
+    ASSERT_EQ(AAFRESULT_SUCCESS, AAFFileOpenTransient(&product_.ident, target.Out()));
+    Ptr<IAAFMob> clone;
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              Get(header_, &IAAFHeader::LookupMob, idOf(0))
+                  ->CloneExternal(kAAFFollowDepend, kAAFNoIncludeMedia, target, clone.Out()));
+    aafNumSlots_t count = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, Get(target, &IAAFFile::GetHeader)->CountMobs(kAAFAllMob, &count));
+    EXPECT_EQ(kMobs, count);
+}
+
 }  // namespace aaf_test

@@ -197,6 +197,12 @@ TEST_F(SourceMob, AppendsSlotsOfTimecodeAndEdgecode) {
               source->AppendEdgecodeSlot({24, 1}, 2, 5, 100, kAAFFt35MM, kAAFEtKeycode, header));
     EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE,
               source->AppendEdgecodeSlot({24, 1}, 2, 5, 100, 5, kAAFEtKeycode, header));
+    for (const aafEdgeType_t odd : {-1, 4, 7, 9}) {
+        EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE,
+                  source->AppendEdgecodeSlot({24, 1}, 2, 5, 100, kAAFFt35MM, odd, nullptr));
+        EXPECT_EQ(AAFRESULT_INVALID_ENUM_VALUE,
+                  Make<IAAFEdgecode>(AUID_AAFEdgecode)->Initialize(100, {5, kAAFFt35MM, odd, {}}));
+    }
     Ptr<IAAFMobSlot> slot = Get(mob, &IAAFMob::LookupSlot, 1);
     EXPECT_EQ(L"Timecode", NameOf(slot));
     ASSERT_EQ(AAFRESULT_SUCCESS, mob->LookupSlot(2, slot.Out()));

@@ -119,9 +119,9 @@ TEST_F(SourceSearch, FollowsClipsFromMobToMob) {
     EXPECT_EQ((Place{kFile, 1, 15, 25}), Found(5, kAAFFileMob));
     EXPECT_EQ((Place{kFile, 1, 15, 25}), Found(5, kAAFAllMob));
     EXPECT_EQ((Place{kFile, 1, 15, 25}), Found(5, kAAFPhysicalMob));
-    // 115 frames of 25 a second are 230 of 50.
-    EXPECT_EQ((Place{kTape, 2, 230, 70}), Found(5, kAAFTapeMob));
-    EXPECT_EQ((Place{kTape, 2, 230, 70}), Found(5, kAAFPrimaryMob));
+    // 115 frames of 25 a second are 230 of 50. Of the tape no more is wanted than of the file.
+    EXPECT_EQ((Place{kTape, 2, 230, 50}), Found(5, kAAFTapeMob));
+    EXPECT_EQ((Place{kTape, 2, 230, 50}), Found(5, kAAFPrimaryMob));
     EXPECT_EQ(AAFRESULT_TRAVERSAL_NOT_POSS, Failure(5, kAAFFilmMob));
     EXPECT_EQ(AAFRESULT_TRAVERSAL_NOT_POSS, Failure(5, kAAFCompMob));
 }
@@ -133,7 +133,7 @@ TEST_F(SourceSearch, GoesOnInASavedFile) {
     Ptr<IAAFMob> master = Get(read, &IAAFHeader::LookupMob, MobId(kMaster));
     Place place;
     EXPECT_EQ(AAFRESULT_SUCCESS, Search(master, 5, kAAFTapeMob, &place));
-    EXPECT_EQ((Place{kTape, 2, 230, 70}), place);
+    EXPECT_EQ((Place{kTape, 2, 230, 50}), place);
     Ptr<IAAFMasterMob> named = As<IAAFMasterMob>(master);
     aafUInt32 bytes = 0;
     aafCharacter name[5] = {};
@@ -225,7 +225,42 @@ TEST_F(SourceSearch, CountsFromTheOriginOfASlot) {
     AddSlot(Add(kTape, AUID_AAFTapeDescriptor), 2, ClipOf(0, 0, 0, 9000));
     AddMaster(ClipOf(kFile, 1, 0, 30));
     EXPECT_EQ((Place{kFile, 1, 1, 29}), Found(1, kAAFFileMob));
-    EXPECT_EQ((Place{kTape, 2, 111, 39}), Found(1, kAAFTapeMob));
+    EXPECT_EQ((Place{kTape, 2, 111, 29}), Found(1, kAAFTapeMob));
+}
+
+TEST_F(SourceSearch, EndsWithTheShortestClipOfTheWay) {
+    AddFileAndTape();
+    AddMaster(ClipOf(kFile, 1, 40, 30));
+    EXPECT_EQ((Place{kFile, 1, 40, 30}), Found(0, kAAFFileMob));
+    // The file has 50 frames.
+    EXPECT_EQ((Place{kTape, 2, 280, 20}), Found(0, kAAFTapeMob));
+    // One that doesn't tell its length shortens nothing.
+    AddSlot(master_, 2, ClipOf(kFile, 1, 0, -1));
+    Place place;
+    EXPECT_EQ(AAFRESULT_SUCCESS, Search(master_, 4, kAAFTapeMob, &place, kAAFFindNull, 2));
+    EXPECT_EQ((Place{kTape, 2, 208, 92}), place);
+    // An effect that takes part of its input.
+    Ptr<IAAFOperationGroup> effect = OfPicture<IAAFOperationGroup>(AUID_AAFOperationGroup, 5);
+    ASSERT_EQ(AAFRESULT_SUCCESS, effect->AppendInputSegment(ClipOf(kFile, 1, 1, 10)));
+    AddSlot(master_, 3, As<IAAFSegment>(effect));
+    EXPECT_EQ(AAFRESULT_SUCCESS, Search(master_, 2, kAAFFileMob, &place, kAAFFindNull, 3));
+    EXPECT_EQ((Place{kFile, 1, 3, 3}), place);
+}
+
+TEST_F(SourceSearch, FindsNothingOutsideOfAClip) {
+    AddFileAndTape();
+    AddMaster(ClipOf(kFile, 1, 10, 30));
+    EXPECT_EQ((Place{kFile, 1, 39, 1}), Found(29, kAAFFileMob));
+    EXPECT_EQ(AAFRESULT_TRAVERSAL_NOT_POSS, Failure(30, kAAFFileMob));
+    EXPECT_EQ(AAFRESULT_TRAVERSAL_NOT_POSS, Failure(-1, kAAFFileMob));
+    // Behind the end of the file's own clip.
+    AddSlot(master_, 2, ClipOf(kFile, 1, 45, 30));
+    EXPECT_EQ(AAFRESULT_TRAVERSAL_NOT_POSS, Failure(5, kAAFTapeMob, kAAFFindNull, 2));
+    // A still has no length but a place.
+    AddSlot(master_, 3, ClipOf(kFile, 1, 7, 0));
+    Place place;
+    EXPECT_EQ(AAFRESULT_SUCCESS, Search(master_, 0, kAAFFileMob, &place, kAAFFindNull, 3));
+    EXPECT_EQ((Place{kFile, 1, 7, 0}), place);
 }
 
 TEST_F(SourceSearch, TellsWhereAWayEnds) {
@@ -268,8 +303,9 @@ TEST_F(SourceSearch, ChecksItsArguments) {
               search->SearchSource(1, 0, kAAFFileMob, nullptr, nullptr, nullptr));
     ASSERT_EQ(AAFRESULT_SUCCESS,
               search->SearchSource(1, 0, kAAFFileMob, nullptr, nullptr, info.Out()));
-    aafLength_t length = 0;
+    aafLength_t length = 77;
     EXPECT_EQ(AAFRESULT_PROP_NOT_PRESENT, info->GetLength(&length));
+    EXPECT_EQ(77, length);
     const aafRational_t rate = Get(info, &IAAFFindSourceInfo::GetEditRate);
     EXPECT_EQ(25, rate.numerator);
     EXPECT_EQ(AAFRESULT_NULL_PARAM, info->GetLength(nullptr));
@@ -327,6 +363,21 @@ TEST_F(SourceSearch, MasterSlotMayHoldASequence) {
     EXPECT_EQ(100, Get(As<IAAFComponent>(sequence), &IAAFComponent::GetLength));
 }
 
+TEST_F(SourceSearch, SlotOfAClipHasTheRateOfTheEventsThatItRefersTo) {
+    Ptr<IAAFMob> file = Add(kFile, AUID_AAFCDCIDescriptor);
+    Ptr<IAAFSequence> events = OfPicture<IAAFSequence>(AUID_AAFSequence, 10);
+    Ptr<IAAFEventMobSlot> slot;
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFMob2>(file)->AppendNewEventSlot(
+                                     {30, 1}, As<IAAFSegment>(events), 1, L"E", 0, slot.Out()));
+    Ptr<IAAFMob> master = Add(kMaster);
+    ASSERT_EQ(AAFRESULT_SUCCESS,
+              As<IAAFMasterMob>(master)->AddMasterSlot(DataDef(kAAFDataDef_LegacyPicture), 1,
+                                                       As<IAAFSourceMob>(file), 1, L"E"));
+    Ptr<IAAFTimelineMobSlot> made =
+        As<IAAFTimelineMobSlot>(Get(master, &IAAFMob::LookupSlot, aafSlotID_t{1}));
+    EXPECT_EQ(30, Get(made, &IAAFTimelineMobSlot::GetEditRate).numerator);
+}
+
 class Pulldown : public SourceSearch {};
 
 TEST_F(Pulldown, IsAsLongAsItsClipBecomes) {
@@ -371,8 +422,9 @@ TEST_F(Pulldown, IsAsLongAsItsClipBecomes) {
     EXPECT_EQ(kAAFTapeToFilmSpeed, Get(pulldown, &IAAFPulldown::GetPulldownDirection));
     EXPECT_EQ(3, Get(pulldown, &IAAFPulldown::GetPhaseFrame));
     // Place 12 of the master, at 25, is 11 of the film, at 24, and 11 of the clip under the
-    // pulldown; 100 + 11 at 24 is 138 at 30.
-    EXPECT_EQ((Place{kTape, 2, 138, 17}), Found(12, kAAFTapeMob));
+    // pulldown; 100 + 11 at 24 is 138 at 30. The 12 that are left of the master are 11 of the film
+    // and of the clip, and 13 of the tape.
+    EXPECT_EQ((Place{kTape, 2, 138, 13}), Found(12, kAAFTapeMob));
 }
 
 TEST_F(Pulldown, ValidCodeStartsBehindAFiller) {

@@ -165,6 +165,18 @@ TEST_F(Stream, OfAChunkTellsItsLength) {
     EXPECT_EQ(AAFRESULT_END_OF_DATA, empty->Read(1, &byte, &count));
 }
 
+TEST_F(Stream, OfAChunkIsEmptyOnceInitializedAgain) {
+    Ptr<IAAFRIFFChunk> chunk = Make<IAAFRIFFChunk>(AUID_AAFRIFFChunk);
+    ASSERT_EQ(AAFRESULT_SUCCESS, chunk->Initialize(1));
+    Write(chunk.get(), kChunk, "stream");
+    EXPECT_EQ(AAFRESULT_SUCCESS, chunk->Initialize(2));
+    EXPECT_EQ(2u, Get(chunk, &IAAFRIFFChunk::GetChunkID));
+    EXPECT_EQ(0, Get(chunk, &IAAFRIFFChunk::GetLength));
+    EXPECT_EQ(0, Get(chunk, &IAAFRIFFChunk::GetPosition));
+    Write(chunk.get(), kChunk, "x");
+    EXPECT_EQ(1, Get(chunk, &IAAFRIFFChunk::GetLength));
+}
+
 TEST_F(Stream, ChannelsOfADigitalInterfaceAreStored) {
     Ptr<IAAFAES3PCMDescriptor2> sound = Make<IAAFAES3PCMDescriptor2>(AUID_AAFAES3PCMDescriptor);
     ASSERT_EQ(AAFRESULT_SUCCESS, sound->Initialize());

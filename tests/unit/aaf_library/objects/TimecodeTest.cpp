@@ -1,7 +1,9 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include <algorithm>
+#include <limits>
 
+#include "aaf_library/model/PropertyKeys.h"
 #include "tests/unit/aaf_library/objects/SavedFile.h"
 
 // Timecode by offset, and timecode as it was recorded.
@@ -80,6 +82,7 @@ TEST_F(TimecodeOffset, OfASequenceIsThatOfItsStretch) {
     EXPECT_EQ(AAFRESULT_SUCCESS, OffsetOf(segment, 1000, &found));
     EXPECT_EQ(0, found);
     EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, OffsetOf(segment, 3000, &found));
+    EXPECT_EQ(0, found);
     aafPosition_t offset = 0;
     aafTimecode_t timecode{};
     aafRational_t rate{25, 1};
@@ -88,6 +91,15 @@ TEST_F(TimecodeOffset, OfASequenceIsThatOfItsStretch) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, segment->SegmentTCToOffset(nullptr, &rate, &found));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, segment->SegmentTCToOffset(&timecode, nullptr, &found));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, segment->SegmentTCToOffset(&timecode, &rate, nullptr));
+}
+
+TEST_F(TimecodeOffset, TellsNothingWhereItWouldOverflow) {
+    Ptr<IAAFSegment> segment = As<IAAFSegment>(Timecode(1000, 10));
+    aafPosition_t offset = std::numeric_limits<aafPosition_t>::max();
+    aafTimecode_t timecode{77, kAAFTcDrop, 30};
+    EXPECT_EQ(AAFRESULT_INVALID_PARAM, segment->SegmentOffsetToTC(&offset, &timecode));
+    EXPECT_EQ(77, timecode.startFrame);
+    EXPECT_EQ(30, timecode.fps);
 }
 
 TEST_F(TimecodeOffset, IsThereInTimecodeOnly) {
@@ -128,6 +140,40 @@ TEST_F(TimecodeOffset, OfAMobIsThatOfItsFirstTimecode) {
     EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, mob->OffsetToMobTimecode(nullptr, &offset, &timecode));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->OffsetToMobTimecode(nullptr, nullptr, &timecode));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, mob->OffsetToMobTimecode(nullptr, &offset, nullptr));
+}
+
+TEST_F(TimecodeOffset, OfAMobIsFoundBehindAShorterPicture) {
+    Ptr<IAAFMob> mob = Make<IAAFMob>(AUID_AAFCompositionMob);
+    const auto append = [&](IAAFSequence* sequence, aafSlotID_t id) {
+        Ptr<IAAFTimelineMobSlot> slot;
+        ASSERT_EQ(AAFRESULT_SUCCESS, mob->AppendNewTimelineSlot({25, 1}, As<IAAFSegment>(sequence),
+                                                                id, L"", 0, slot.Out()));
+    };
+    Ptr<IAAFSequence> empty = Make<IAAFSequence>(AUID_AAFSequence);
+    ASSERT_EQ(AAFRESULT_SUCCESS, empty->Initialize(DataDef(kAAFDataDef_LegacyPicture)));
+    Ptr<IAAFSequence> picture = Make<IAAFSequence>(AUID_AAFSequence);
+    ASSERT_EQ(AAFRESULT_SUCCESS, picture->Initialize(DataDef(kAAFDataDef_LegacyPicture)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, picture->AppendComponent(As<IAAFComponent>(Clip(10))));
+    append(empty, 1);
+    append(picture, 2);
+    append(TwoStretches(), 3);
+    aafPosition_t offset = 12;
+    aafTimecode_t timecode{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, mob->OffsetToMobTimecode(nullptr, &offset, &timecode));
+    EXPECT_EQ(5002, timecode.startFrame);
+    aafFrameOffset_t found = -1;
+    EXPECT_EQ(AAFRESULT_TIMECODE_NOT_FOUND, FrameAt(As<IAAFSegment>(empty), 0, &found));
+    EXPECT_EQ(AAFRESULT_TIMECODE_NOT_FOUND, FrameAt(As<IAAFSegment>(picture), 12, &found));
+}
+
+// Why a timecode isn't there is told by the timecode, not by what stands behind it.
+TEST_F(TimecodeOffset, OfASequenceIsMissedInItsTimecode) {
+    Ptr<IAAFSequence> sequence = TwoStretches();
+    ASSERT_EQ(AAFRESULT_SUCCESS, sequence->AppendComponent(Filler(10, kAAFDataDef_LegacyTimecode)));
+    aafFrameOffset_t found = -1;
+    EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, OffsetOf(As<IAAFSegment>(sequence), 3000, &found));
+    EXPECT_EQ(AAFRESULT_TIMECODE_NOT_FOUND, FrameAt(As<IAAFSegment>(sequence), 25, &found));
+    EXPECT_EQ(AAFRESULT_BADSAMPLEOFFSET, FrameAt(As<IAAFSegment>(sequence), 30, &found));
 }
 
 class RecordedTimecode : public SavedFile {
@@ -270,6 +316,44 @@ TEST_F(RecordedTimecode, ChecksItsArguments) {
     EXPECT_EQ(AAFRESULT_NULL_PARAM, stream->GetSource(8, bytes, nullptr));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, stream->GetSourceBufLen(nullptr));
     EXPECT_EQ(AAFRESULT_NULL_PARAM, stream->SetSource(8, nullptr));
+}
+
+// A recording of 25 frames has a flag in the place where one of 30 tells that it drops numbers.
+TEST_F(RecordedTimecode, DropsNumbersOfThirtyFramesOnly) {
+    Ptr<IAAFTimecodeStream> stream = Stream({25, 1});
+    EXPECT_EQ(AAFRESULT_INVALID_TIMECODE, stream->SetPositionTimecode(0, {5000, kAAFTcDrop, 25}));
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetPositionTimecode(0, {5000, kAAFTcNonDrop, 25}));
+    std::vector<int> word = Words(stream);
+    std::vector<aafUInt8> flagged(word.begin(), word.end());
+    flagged[1] |= 0x04;
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetSource(8, flagged.data()));
+    aafTimecode_t found{};
+    EXPECT_EQ(AAFRESULT_SUCCESS, stream->GetPositionTimecode(0, &found));
+    EXPECT_EQ(5000, found.startFrame);
+    EXPECT_EQ(kAAFTcNonDrop, found.drop);
+}
+
+// Whoever reads the stream by its value stands at the end of what is there now.
+TEST_F(RecordedTimecode, MayBecomeShorterWhileItIsRead) {
+    Ptr<IAAFTimecodeStream> stream = Stream({25, 1});
+    aafUInt8 bytes[16] = {};
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetSource(16, bytes));
+    Ptr<IAAFObject> object = As<IAAFObject>(stream);
+    Ptr<IAAFPropertyDef> source =
+        Get(Get(object, &IAAFObject::GetDefinition), &IAAFClassDef::LookupPropertyDef,
+            aaf::prop::TimecodeStream_Source.id);
+    Ptr<IAAFPropertyValue> value = Get(object, &IAAFObject::GetPropertyValue, source);
+    Ptr<IAAFTypeDefStream> type = As<IAAFTypeDefStream>(Get(source, &IAAFPropertyDef::GetTypeDef));
+    ASSERT_EQ(AAFRESULT_SUCCESS, type->SetPosition(value, 16));
+    ASSERT_EQ(AAFRESULT_SUCCESS, stream->SetSource(4, bytes));
+    aafInt64 position = 0;
+    EXPECT_EQ(AAFRESULT_SUCCESS, type->GetPosition(value, &position));
+    EXPECT_EQ(4, position);
+    aafUInt32 read = 0;
+    EXPECT_EQ(AAFRESULT_END_OF_DATA, type->Read(value, sizeof bytes, bytes, &read));
+    Ptr<IAAFTypeDef> number = Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_UInt32);
+    EXPECT_EQ(AAFRESULT_END_OF_DATA, type->ReadElements(value, number, sizeof bytes, bytes, &read));
+    EXPECT_EQ(0u, read);
 }
 
 }  // namespace aaf_test

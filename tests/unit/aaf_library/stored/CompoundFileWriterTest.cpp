@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/stored/CompoundFileWriter.h"
 
+#include "aaf_library/stored/CompoundFileLimits.h"
 #include "aaf_library/stored/CompoundFileReader.h"
 #include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/UpperCase.h"
@@ -108,14 +109,14 @@ TEST(CompoundFileWriter, LaysOutASmallFileByteForByte) {
         root[2 * i] = static_cast<std::uint8_t>(name[i]);
     }
     const Bytes rootTail = {22,   0, 5, 1,  0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF,
-                            0xFF, 2, 0, 0,  0,    1,    2,    3,    4,    5,    6,
+                            0xFF, 1, 0, 0,  0,    1,    2,    3,    4,    5,    6,
                             7,    8, 9, 10, 11,   12,   13,   14,   15,   16};
     std::copy(rootTail.begin(), rootTail.end(), root.begin() + 64);
     root[120] = 64;
     EXPECT_EQ(entry(0), root);
 
     Bytes stream(128);
-    const Bytes streamTail = {6,    0,    2,    1,    0xFF, 0xFF, 0xFF, 0xFF,
+    const Bytes streamTail = {6,    0,    2,    1,    2,    0,    0,    0,
                               0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF};
     stream[0] = 'a';
     stream[2] = 'b';
@@ -123,14 +124,26 @@ TEST(CompoundFileWriter, LaysOutASmallFileByteForByte) {
     stream[120] = 2;
     EXPECT_EQ(entry(1), stream);
 
-    // The shorter name comes first; what has no content begins at no sector.
+    // The shorter name comes first, so it is on the left, in a last level that is not full and so
+    // red. A storage has neither a first sector nor a size.
     Bytes contained(128);
-    const Bytes containedTail = {4, 0, 1, 1, 0xFF, 0xFF, 0xFF, 0xFF, 1, 0, 0, 0, 3, 0, 0, 0};
+    const Bytes containedTail = {4,    0,    1,    0,    0xFF, 0xFF, 0xFF, 0xFF,
+                                 0xFF, 0xFF, 0xFF, 0xFF, 3,    0,    0,    0};
     contained[0] = 'c';
     std::copy(containedTail.begin(), containedTail.end(), contained.begin() + 64);
-    std::fill(contained.begin() + 116, contained.begin() + 120, 0xFF);
-    contained[116] = 0xFE;
     EXPECT_EQ(entry(2), contained);
+
+    // A stream without content begins at no sector.
+    Bytes empty(128);
+    const Bytes emptyTail = {10,   0,    2,    1,    0xFF, 0xFF, 0xFF, 0xFF,
+                             0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF, 0xFF};
+    for (std::size_t i = 0; i < 4; ++i) {
+        empty[2 * i] = static_cast<std::uint8_t>("none"[i]);
+    }
+    std::copy(emptyTail.begin(), emptyTail.end(), empty.begin() + 64);
+    std::fill(empty.begin() + 116, empty.begin() + 120, 0xFF);
+    empty[116] = 0xFE;
+    EXPECT_EQ(entry(3), empty);
 
     Bytes table(512, 0xFF);
     table[0] = table[4] = table[8] = 0xFE;
@@ -296,9 +309,22 @@ TEST(CompoundFileWriter, RefusesNamesThatNoEntryCanHold) {
 TEST(CompoundFileWriter, RefusesANameTwiceInOneStorage) {
     EXPECT_EQ(Refusal(u"name", u"name"), "\"name\" is twice in one storage");
     EXPECT_EQ(Refusal(u"name", u"Name"), "\"Name\" is twice in one storage");
+    EXPECT_EQ(Refusal(u"\u00C9t\u00E9", u"\u00E9T\u00C9"),
+              "\"\xC3\xA9T\xC3\x89\" is twice in one storage");
+    EXPECT_NE(Refusal(u"\u03C9", u"\u03A9"), "") << "Greek";
+    EXPECT_NE(Refusal(u"\u01C6", u"\u01C5"), "") << "one that has a form for titles";
+    EXPECT_EQ(Refusal(u"\u00DF", u"SS"), "") << "a letter has one capital or none";
     CompoundFileWriter writer(SectorSize::Bytes512);
     writer.AddStream(writer.AddStorage(kRoot, u"name"), u"name", {});
     EXPECT_NO_THROW(writer.Finish());
+}
+
+// Bytes from 0x7FFFFF00 on, up to 2 GiB, are where programs lock.
+TEST(CompoundFileLimits, AreThoseOfTheFormatAndOfMemory) {
+    EXPECT_EQ(LargestFile(SectorSize::Bytes512), 0x7FFFFE00u) << "the last whole sector before";
+    EXPECT_EQ(LockSector(SectorSize::Bytes512), kFreeSector) << "no file reaches it";
+    EXPECT_EQ(LargestFile(SectorSize::Bytes4096), 0x100000000u);
+    EXPECT_EQ((LockSector(SectorSize::Bytes4096) + 1) * 4096u, 0x7FFFF000u) << "the sector of it";
 }
 
 TEST(UpperCase, FollowsTheSimpleMappings) {

@@ -613,7 +613,8 @@ void LookAt(const Object& object) {
         aafInt64 number = 0;
         object.ReadInteger(key, &number);
         object.StringOr(key, L"");
-        object.WeakTargets(key);
+        object.WeakTargetAt(key, 0);
+        object.WeakTargetAt(key, 1);
         for (const RefPtr<Object>& contained : value->objects()) {
             EXPECT_EQ(contained->owner(), &object);
             LookAt(*contained);

@@ -5,11 +5,11 @@
 #include <functional>
 #include <map>
 #include <string>
-#include <tr1/memory>
 #include <vector>
 
 #include "source/clips/BaseClip.h"
 #include "source/plugin/NCFSmartPtr.h"
+#include "source/plugin/Tr1Memory.h"
 
 struct IAAFFile;
 

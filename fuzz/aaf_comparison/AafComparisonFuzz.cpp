@@ -1,0 +1,66 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// Arbitrary bytes as an AAF file, compared through the library's interfaces: a file is like itself,
+// and all of it is other than nothing.
+
+#include <cstdint>
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+
+#include "fuzz/support/RunLimits.h"
+#include "host_interfaces/aaf/AAFExports.h"
+#include "reference_host/cliphost/AafComparison.h"
+#include "reference_host/util/Ref.h"
+#include "tests/support/TestFolder.h"
+#include "text/Encodings.h"
+
+// The library's function, linked by name.
+extern "C" HRESULT AAFFileOpenExistingRead(aafCharacter_constptr fileName, aafUInt32 modeFlags,
+                                           IAAFFile** file);
+
+namespace {
+
+// One file for the whole run, deleted at its end.
+const std::filesystem::path& TheFile() {
+    static const TestFolder folder;
+    static const std::filesystem::path path = folder / "input.aaf";
+    return path;
+}
+
+host::Ref<IAAFFile> Open() {
+    static const std::wstring name =
+        encodings::ToWideLossy(encodings::FromUtf8(TheFile().string()));
+    host::Ref<IAAFFile> file;
+    if (AAFFileOpenExistingRead(name.c_str(), 0, file.Out()) < 0) {
+        file.Reset();
+    }
+    return file;
+}
+
+}  // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+    const fuzz::TimeLimit limit;
+    std::ofstream(TheFile(), std::ios::binary)
+        .write(reinterpret_cast<const char*>(data), static_cast<std::streamsize>(size));
+    const host::Ref<IAAFFile> before = Open();
+    const host::Ref<IAAFFile> after = Open();
+    if (!before || !after) {
+        return 0;
+    }
+    std::size_t told = 0;
+    const auto count = [&](const cliphost::ComparedObject& object,
+                           const cliphost::TreeDifference& difference) {
+        told += (InWords(object) + InWords(difference)).empty() ? 0 : 1;
+    };
+    if (!cliphost::CompareFiles(before.get(), after.get(), count).AreEqual() || told > 0) {
+        std::abort();
+    }
+    const cliphost::ComparisonCounts none = cliphost::CompareFiles(before.get(), nullptr, count);
+    if (none.alike > 0 || none.differences != told) {
+        std::abort();
+    }
+    return 0;
+}

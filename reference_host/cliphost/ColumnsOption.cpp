@@ -1,0 +1,14 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/ColumnsOption.h"
+
+namespace cliphost {
+
+void AddColumnsOption(CLI::App& verb, GivenColumns& columns) {
+    verb.add_option("--columns", columns.file,
+                    "A table (CSV) with a row for each movie, told by its columns path or name: "
+                    "name, reel, start timecode, and any column of a bin, to be written into the "
+                    "descriptions");
+}
+
+}  // namespace cliphost

@@ -1,0 +1,288 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/ReportRun.h"
+
+#include <fmt/format.h>
+
+#include <ctime>
+#include <fstream>
+
+#include "host_interfaces/Version.h"
+#include "reference_host/cliphost/CatalogFile.h"
+#include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/MapOption.h"
+#include "reference_host/cliphost/ReportClip.h"
+#include "reference_host/cliphost/ReportOdd.h"
+#include "reference_host/cliphost/ReportPictures.h"
+#include "reference_host/cliphost/ReportShape.h"
+#include "reference_host/cliphost/Words.h"
+#include "reference_host/framework/HostPath.h"
+#include "reference_host/report/PageText.h"
+#include "reference_host/util/text/FileUrl.h"
+
+namespace cliphost {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+constexpr char kEndingOfFolder[] = "_files";
+constexpr char kPoster[] = "poster";
+constexpr char kStrip[] = "strip";
+constexpr std::int64_t kNanoseconds = 1'000'000'000;
+
+const DescriptionForm& FormOfClip() {
+    static const DescriptionForm form = [] {
+        DescriptionForm json;
+        json.json = true;
+        json.hasNumbers = true;
+        return json;
+    }();
+    return form;
+}
+
+// "2026-01-31T12:00:00Z"
+std::string TimeText(std::time_t seconds) {
+    char text[32];
+    std::tm parts{};
+    gmtime_r(&seconds, &parts);
+    return {text, std::strftime(text, sizeof text, "%Y-%m-%dT%H:%M:%SZ", &parts)};
+}
+
+bool IsDatabase(const std::filesystem::path& file) {
+    constexpr std::string_view kMark = "SQLite format 3";
+    char start[kMark.size()] = {};
+    std::ifstream(file, std::ios::binary).read(start, sizeof start);
+    return std::string_view(start, sizeof start) == kMark;
+}
+
+// What becomes of bytes that are no UTF-8 is the JSON writer's to say.
+std::string Dumped(const Json& json) {
+    return json.dump(-1, ' ', false, Json::error_handler_t::replace);
+}
+
+std::string TitleOf(const ReportOptions& options) {
+    if (!options.title.empty()) {
+        return options.title;
+    }
+    const std::vector<std::filesystem::path>& paths = options.movies.paths;
+    if (paths.size() != 1) {
+        return "Report of movies";
+    }
+    const std::filesystem::path whole = AbsolutePath(paths[0]);
+    return host::DisplayPath(whole.has_filename() ? whole.filename()
+                                                  : whole.parent_path().filename());
+}
+
+// "00017-poster.webp"
+std::string PictureName(std::size_t number, const char* name, std::string_view type) {
+    return fmt::format("{:05}-{}.{}", number, name, type.substr(type.find('/') + 1));
+}
+
+}  // namespace
+
+void TakeCatalogs(ReportOptions& options) {
+    std::vector<std::filesystem::path> paths;
+    for (const std::filesystem::path& path : options.movies.paths) {
+        std::error_code ignored;
+        if (!std::filesystem::is_regular_file(path, ignored) || !IsDatabase(path)) {
+            paths.push_back(path);
+            continue;
+        }
+        options.title = options.title.empty() && options.movies.paths.size() == 1
+                            ? host::DisplayPath(path.filename())
+                            : options.title;
+        options.catalogs.push_back(OpenCatalog(path, catalog::Catalog::For::Reading));
+        WithCatalog(path, [&] {
+            catalog::Statement select =
+                options.catalogs.back().database().Prepare("SELECT path FROM movies ORDER BY path");
+            while (select.Step()) {
+                paths.push_back(PathOfMachinePath(select.Text(0)));
+            }
+        });
+    }
+    options.movies.paths = std::move(paths);
+}
+
+ReportRun::ReportRun(Session& session, ReportOptions& options)
+    : MoviesRun(session, options.movies, "reading", ".html"),
+      options_(options),
+      maps_(options.maps),
+      codecs_(session) {
+    const std::filesystem::path& file = options.movies.together;
+    if (options.json) {
+        return;
+    }
+    std::error_code ignored;
+    takesPlace_ = std::filesystem::exists(file, ignored);
+    output_.emplace(file);
+    if (options.isSplit) {
+        folder_ = file;
+        folder_.replace_filename(file.stem().native() + kEndingOfFolder);
+        madeFolder_.emplace(folder_);
+    }
+    page_.emplace(
+        [this](std::string_view text) {
+            output_->Write(text.data(), text.size());
+            written_ += text.size();
+        },
+        report::Page::Form{TitleOf(options), options.isSplit});
+}
+
+MovieAnswer ReportRun::Answer(const MovieStep& step, const PlaceOfFile&) {
+    return ReportAnswer(session(), codecs_, options_.maps, step.movie);
+}
+
+bool ReportRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
+    return FromBytes(bytes, FormOfClip(), answer);
+}
+
+void ReportRun::Show(const std::filesystem::path& movie, const MovieAnswer& answer,
+                     const std::filesystem::path&) {
+    maps_.AddUsed(answer.mapsUsed);
+    Add(movie, ClipFrom(answer.description), false);
+}
+
+std::optional<catalog::Entry> ReportRun::EntryInCatalogs(const std::filesystem::path& movie) {
+    for (catalog::Catalog& one : options_.catalogs) {
+        if (auto entry = one.Read(AbsoluteMachinePath(movie))) {
+            return entry;
+        }
+    }
+    return std::nullopt;
+}
+
+void ReportRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    std::error_code ignored;
+    if (std::filesystem::is_directory(movie, ignored)) {
+        return;  // of movies, there are none in it
+    }
+    const auto known = EntryInCatalogs(movie);
+    Json clip =
+        known ? ClipOf(*known) : Json{{"facts", Json::object()}, {"details", Json::object()}};
+    Json& facts = clip["facts"];
+    facts["route"] = problem.route.empty() ? route::kNone : problem.route;
+    Json warning = {{"kind", "failure"}, {"reason", problem.reason}};
+    if (!problem.hint.empty()) {
+        warning["hint"] = problem.hint;
+    }
+    Json warnings = Json::array({std::move(warning)});
+    for (Json& before : facts["warnings"]) {
+        warnings.push_back(std::move(before));
+    }
+    facts["warnings"] = std::move(warnings);
+    Add(movie, std::move(clip), true);
+}
+
+// Sets what a movie is as a file.
+void ReportRun::AddFile(const std::filesystem::path& movie, Json& facts) {
+    const std::filesystem::path whole = AbsolutePath(movie);
+    facts["path"] = MachinePath(whole);
+    facts["file"] = host::DisplayPath(whole.filename());
+    facts["folder"] = host::DisplayPath(whole.parent_path());
+    std::string url = host::text::FileUrl(whole.native());
+    if (maps_.MapToOther(url)) {
+        facts["place"] = url;
+    }
+    if (const auto state = StateBefore()) {
+        facts["size"] = state->size;
+        facts["date"] = TimeText(static_cast<std::time_t>(state->date / kNanoseconds));
+    }
+}
+
+void ReportRun::Add(const std::filesystem::path& movie, Json clip, bool hasFailed) {
+    Json& facts = clip["facts"];
+    Json& details = clip["details"];
+    AddFile(movie, facts);
+    facts["failed"] = hasFailed;
+    facts.emplace("name", host::DisplayPath(movie.stem()));
+    for (const char* const list : {"traits", "warnings"}) {
+        facts.emplace(list, Json::array());
+    }
+    if (options_.json) {
+        facts["details"] = std::move(details);
+    } else {
+        PutBeside(facts, kPoster);
+        PutBeside(details, kStrip);
+        page_->AddClip(clips_.size(), Dumped(details));
+    }
+    clips_.push_back(std::move(facts));
+}
+
+// Puts a picture's bytes into a file of the folder, where there is one.
+void ReportRun::PutBeside(Json& owner, const char* name) {
+    const auto picture = owner.find(name);
+    if (folder_.empty() || picture == owner.end()) {
+        return;
+    }
+    const std::filesystem::path file =
+        folder_ / PictureName(clips_.size(), name, picture->value("type", std::string()));
+    const std::string bytes = report::FromBase64(picture->value("data", std::string()));
+    WriteWholeFile(file, {bytes.begin(), bytes.end()});
+    picture->erase("data");
+    (*picture)["file"] =
+        host::text::PercentEncoded((folder_.filename() / file.filename()).native());
+}
+
+// Those of an earlier page with more clips.
+void ReportRun::RemoveOldPictures() const {
+    for (std::size_t number = clips_.size();; ++number) {
+        std::error_code ignored;
+        bool isThere = false;
+        for (const std::string& name :
+             {PictureName(number, kPoster, kWebp), PictureName(number, kPoster, kPng),
+              PictureName(number, kStrip, kWebp)}) {
+            isThere = std::filesystem::remove(folder_ / name, ignored) || isThere;
+        }
+        if (!isThere) {
+            return;
+        }
+    }
+}
+
+void ReportRun::WritePage() {
+    Json document = {{"title", TitleOf(options_)},
+                     {"made", TimeText(std::time(nullptr))},
+                     {"program", "cliphost " PRODUCT_VERSION_TEXT},
+                     {"isWhole", !IsStopped()}};
+    Json odd = OddThings(clips_);
+    document["clips"] = std::move(clips_);
+    document["odd"] = std::move(odd);
+    if (options_.json) {
+        PrintJson(schema::kReport, std::move(document));
+        return;
+    }
+    const std::size_t count = document["clips"].size();
+    page_->End(Dumped(WithSchema(schema::kReport, std::move(document))));
+    output_->Finish();
+    if (!host::system::IsStandardOutput(options_.movies.together)) {
+        fmt::print("{}: {}, {:.1f} MB\n", host::DisplayPath(options_.movies.together),
+                   Counted(count, "clip"), static_cast<double>(written_) / 1e6);
+    }
+}
+
+void ReportRun::TellUnusedMaps(int read) {
+    if (read > 0 && !IsStopped() && options_.movies.shard.IsWhole()) {
+        for (const Failure& unused :
+             UnusedMaps(maps_, "give FROM as the locators of `cliphost describe` begin")) {
+            TellAlso(unused);
+        }
+    }
+}
+
+void ReportRun::Finish(int read, int) {
+    const std::filesystem::path& file = options_.movies.together;
+    if (!options_.json && clips_.empty()) {
+        TellAlso(Failure(kExitFile, file, "not written: there is no movie to show"));
+    } else if (IsStopped() && takesPlace_) {
+        TellAlso(Failure(kExitFile, file, "left as it was: not all movies were read"));
+    } else {
+        if (!folder_.empty()) {
+            RemoveOldPictures();
+        }
+        WritePage();
+    }
+    TellUnusedMaps(read);
+}
+
+}  // namespace cliphost

@@ -1,0 +1,200 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/data_check/Entry.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <charconv>
+#include <numeric>
+
+namespace data_check {
+namespace {
+
+using host::PlacedAttribute;
+using host::PlacedElement;
+
+// Its blanks count.
+constexpr std::string_view kCode = "FourChar";
+
+constexpr std::size_t kLongestNumber = 9;     // in digits; one of 32 bits takes it
+constexpr std::size_t kLongestShown = 60;     // of a value or name
+constexpr std::size_t kLongestCompared = 64;  // of names
+constexpr std::size_t kLikeness = 2;          // letters in which a mistyped name may differ
+
+bool HasOuterBlank(const std::string& text) {
+    constexpr const char* kBlanks = " \t\r\n";
+    return text.empty() || text.find_first_of(kBlanks) == 0 ||
+           text.find_last_of(kBlanks) == text.size() - 1;
+}
+
+std::string Shown(const std::string& text) {
+    return text.size() <= kLongestShown ? text : text.substr(0, kLongestShown) + "...";
+}
+
+// How many letters have to be put in, taken out or changed.
+std::size_t Distance(std::string_view a, std::string_view b) {
+    std::vector<std::size_t> row(b.size() + 1);
+    std::iota(row.begin(), row.end(), std::size_t{0});
+    for (std::size_t i = 1; i <= a.size(); ++i) {
+        std::size_t diagonal = row[0]++;
+        for (std::size_t j = 1; j <= b.size(); ++j) {
+            const std::size_t changed = diagonal + (a[i - 1] == b[j - 1] ? 0 : 1);
+            diagonal = row[j];
+            row[j] = std::min({row[j] + 1, row[j - 1] + 1, changed});
+        }
+    }
+    return row.back();
+}
+
+std::string HintFor(const std::string& name, const std::vector<const char*>& known) {
+    for (const char* const one : known) {
+        if (name.size() <= kLongestCompared && Distance(name, one) <= kLikeness) {
+            return fmt::format("write {}, as the module spells it", one);
+        }
+    }
+    std::string all;
+    for (const char* const one : known) {
+        all += (all.empty() ? "" : ", ") + std::string(one);
+    }
+    return all.empty() ? "take it out: the value itself stands here"
+                       : fmt::format("take it out; the module reads: {}", all);
+}
+
+void CheckName(const EntryReader& reader, const std::string& name, host::XmlPlace place,
+               const std::vector<const char*>& known) {
+    const auto isThis = [&](const char* one) { return name == one; };
+    if (name.rfind("xmlns", 0) != 0 && std::none_of(known.begin(), known.end(), isThis)) {
+        reader.Tell(place, fmt::format("{} means nothing here", Shown(name)), HintFor(name, known));
+    }
+}
+
+}  // namespace
+
+std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
+    std::vector<Item> items;
+    for (const PlacedAttribute& attribute : parent.attributes) {
+        if (attribute.name == name) {
+            items.push_back({attribute.value, attribute.place});
+        }
+    }
+    for (const PlacedElement& child : parent.elements) {
+        if (child.name == name) {
+            items.push_back({child.text, child.place});
+        }
+    }
+    return items;
+}
+
+std::optional<std::uint32_t> NumberIn(const std::string& text) {
+    std::uint32_t number = 0;
+    const char* const end = text.data() + text.size();
+    const bool isPlain =
+        !text.empty() && text.size() <= kLongestNumber &&
+        std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; }) &&
+        (text.size() == 1 || text[0] != '0');
+    return isPlain && std::from_chars(text.data(), end, number).ptr == end
+               ? std::optional<std::uint32_t>(number)
+               : std::nullopt;
+}
+
+std::optional<Item> EntryReader::One(const PlacedElement& parent, const char* name,
+                                     const std::string& hint) const {
+    std::vector<Item> items = ItemsOf(parent, name);
+    if (items.empty()) {
+        Tell(parent.place, fmt::format("{} lacks {}", parent.name, name), hint);
+        return std::nullopt;
+    }
+    if (items.size() > 1) {
+        Tell(items[1].place, fmt::format("{} stands here a second time", name),
+             "take out all but one; the first counts");
+        return std::nullopt;
+    }
+    return std::move(items[0]);
+}
+
+std::optional<std::uint32_t> EntryReader::Number(const PlacedElement& parent,
+                                                 const NumberRule& rule) const {
+    if (!rule.isMandatory && ItemsOf(parent, rule.name).empty()) {
+        return std::nullopt;
+    }
+    const std::string hint = fmt::format("give {}", rule.accepted);
+    const std::optional<Item> item = One(parent, rule.name, hint);
+    if (!item) {
+        return std::nullopt;
+    }
+    const std::optional<std::uint32_t> number = NumberIn(item->value);
+    if (!number || !rule.accepts(*number)) {
+        Tell(item->place, fmt::format("{} can't be \"{}\"", rule.name, Shown(item->value)), hint);
+        return std::nullopt;
+    }
+    return number;
+}
+
+const PlacedElement* EntryReader::OneChild(const PlacedElement& parent, const char* name,
+                                           const std::string& hint) const {
+    const PlacedElement* found = nullptr;
+    for (const PlacedElement& child : parent.elements) {
+        if (child.name == name && found != nullptr) {
+            Tell(child.place, fmt::format("{} stands here a second time", name),
+                 "take out all but one; the first counts");
+            return found;
+        }
+        found = child.name == name ? &child : found;
+    }
+    if (found == nullptr) {
+        Tell(parent.place, fmt::format("{} lacks {}", parent.name, name), hint);
+    }
+    return found;
+}
+
+void EntryReader::CheckNames(const PlacedElement& parent,
+                             const std::vector<const char*>& known) const {
+    for (const PlacedAttribute& attribute : parent.attributes) {
+        CheckName(*this, attribute.name, attribute.place, known);
+    }
+    for (const PlacedElement& child : parent.elements) {
+        CheckName(*this, child.name, child.place, known);
+    }
+}
+
+void EntryReader::CheckBlanks(const PlacedElement& element) const {
+    const auto check = [&](const std::string& name, const std::string& value,
+                           host::XmlPlace place) {
+        if (name != kCode && HasOuterBlank(value)) {
+            Tell(
+                place, fmt::format("{} is empty or has blanks around it", name),
+                "write the value with nothing around it; the module takes blanks for a part of it");
+        }
+    };
+    for (const PlacedAttribute& attribute : element.attributes) {
+        check(attribute.name, attribute.value, attribute.place);
+    }
+    if (element.attributes.empty() && element.elements.empty()) {
+        check(element.name, element.text, element.place);
+    }
+    for (const PlacedElement& child : element.elements) {
+        CheckBlanks(child);
+    }
+}
+
+std::vector<const PlacedElement*> EntriesOf(const PlacedElement& root, const char* name,
+                                            const EntryReader& reader) {
+    std::vector<const PlacedElement*> entries;
+    if (root.name == name) {
+        return {&root};
+    }
+    for (const PlacedElement& child : root.elements) {
+        if (child.name == name) {
+            entries.push_back(&child);
+        } else {
+            CheckName(reader, child.name, child.place, {name});
+        }
+    }
+    if (entries.empty()) {
+        reader.Tell(root.place, fmt::format("there is no {} in it", name), "add one");
+    }
+    return entries;
+}
+
+}  // namespace data_check

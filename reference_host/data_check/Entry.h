@@ -1,0 +1,61 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <optional>
+
+#include "reference_host/data_check/Findings.h"
+#include "reference_host/xml/PlacedDocument.h"
+
+namespace data_check {
+
+// A value of an entry, which is written as an attribute or as a child element.
+struct Item {
+    std::string value;
+    host::XmlPlace place;
+};
+
+// Which numbers a value may be.
+struct NumberRule {
+    const char* name;
+    bool (*accepts)(std::uint32_t);
+    const char* accepted;  // in words
+    bool isMandatory;
+};
+
+// Reads items of one document and tells what is wrong with them.
+class EntryReader {
+public:
+    EntryReader(DataFile file, Findings& findings) : file_(file), findings_(findings) {}
+
+    void Tell(host::XmlPlace place, std::string what, std::string hint) const {
+        findings_.Tell(file_, place, std::move(what), std::move(hint));
+    }
+    // The only item of a name. Without one, or with several, that is told, and nothing given.
+    std::optional<Item> One(const host::PlacedElement& parent, const char* name,
+                            const std::string& hint) const;
+    // The number of an item; nothing where it lacks, which is told where it must not, or is wrong.
+    std::optional<std::uint32_t> Number(const host::PlacedElement& parent,
+                                        const NumberRule& rule) const;
+    // The only child of a name. The same.
+    const host::PlacedElement* OneChild(const host::PlacedElement& parent, const char* name,
+                                        const std::string& hint) const;
+    // Tells attributes and children that are none of these.
+    void CheckNames(const host::PlacedElement& parent, const std::vector<const char*>& known) const;
+    // Tells values that begin or end with blanks, or are empty.
+    void CheckBlanks(const host::PlacedElement& element) const;
+
+private:
+    DataFile file_;
+    Findings& findings_;
+};
+
+std::vector<Item> ItemsOf(const host::PlacedElement& parent, std::string_view name);
+// A whole number as the module compares it: no sign, no zeros before it.
+std::optional<std::uint32_t> NumberIn(const std::string& text);
+// The entries of a name in a document, which may be one itself. What else stands beside them is
+// told.
+std::vector<const host::PlacedElement*> EntriesOf(const host::PlacedElement& root, const char* name,
+                                                  const EntryReader& reader);
+
+}  // namespace data_check

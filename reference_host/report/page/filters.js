@@ -1,0 +1,129 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// Which clips the table shows: what is searched, chips that are pressed, the order, and groups.
+
+const TRAIT_NAMES = {
+  noSound: 'No sound',
+  silent: 'Silent',
+  noTimecode: 'No timecode',
+  variableRate: 'Variable rate',
+  rotated: 'Rotated',
+  pixelAspect: 'Pixels not square',
+  edits: 'Edit list',
+  provider: 'Sample provider',
+  notInterleaved: 'Poorly interleaved',
+};
+
+// Of each kind one chip has to fit, where some are pressed.
+const CHIP_KINDS = [
+  {title: 'Codec', of: (clip) => [codecText(clip) || (clip.channels ? 'Sound alone' : '')]},
+  {title: 'Rate', of: (clip) => [clip.rate ? rateText(clip.rate) + '\u00a0fps' : '']},
+  {title: 'Worth a look',
+   of: (clip) => [clip.failed ? 'Not described' : clip.warnings.length ? 'Warnings' : '',
+                  ...clip.traits.map((trait) => TRAIT_NAMES[trait.id] || trait.id)]},
+];
+const MOST_CHIPS = 8;  // of a kind
+
+// `numbers`: clips of a group come together; those without one come last.
+const GROUPINGS = [
+  {id: 'none', title: 'Nothing'},
+  {id: 'folder', title: 'Folder', of: (clip) => clip.folder},
+  {id: 'codec', title: 'Codec', of: (clip) => codecText(clip) || 'No picture'},
+  {id: 'rate', title: 'Rate', of: (clip) => clip.rate ? rateText(clip.rate) + '\u00a0fps' : 'No rate'},
+];
+
+const byNumber = (of) => (a, b) => {
+  const left = of(a);
+  const right = of(b);
+  if (left === undefined || right === undefined) return (left === undefined) - (right === undefined);
+  return left - right;
+};
+const words = new Intl.Collator('en', {numeric: true, sensitivity: 'base'});
+const byText = (of) => (a, b) => {
+  const left = of(a) || '';
+  const right = of(b) || '';
+  return left && right ? words.compare(left, right) : (left === '') - (right === '');
+};
+
+// A column of the table; `css` names it where screens are too narrow for all.
+const COLUMNS = [
+  {id: 'name', title: 'Name', order: byText((clip) => clip.name)},
+  {id: 'length', title: 'Length', number: true, order: byNumber((clip) => clip.seconds),
+   text: (clip) => durationText(clip.seconds)},
+  {id: 'start', title: 'Timecode', order: byText((clip) => clip.start),
+   text: (clip) => clip.hasTimecode === false ? '' : clip.start || ''},
+  {id: 'rate', title: 'Rate', number: true, order: byNumber((clip) => ratio(clip.rate) || undefined),
+   text: (clip) => rateText(clip.rate)},
+  {id: 'raster', title: 'Raster', number: true,
+   order: byNumber((clip) => clip.width ? clip.width * clip.height : undefined), text: rasterText},
+  {id: 'codec', title: 'Codec', order: byText(codecText), text: codecText},
+  {id: 'sound', title: 'Sound', order: byText(soundText), text: soundText},
+  {id: 'size', title: 'Size', number: true, order: byNumber((clip) => clip.size),
+   text: (clip) => bytesText(clip.size)},
+  {id: 'date', title: 'Date', order: byText((clip) => clip.date), text: (clip) => dateText(clip.date)},
+  {id: 'warnings', title: 'Warnings', number: true,
+   order: byNumber((clip) => clip.warnings.length + clip.traits.length / 100)},
+];
+
+const filters = {
+  words: '',
+  pressed: CHIP_KINDS.map(() => new Set()),
+  only: null,  // numbers of clips of a finding, with its title
+  sort: 'name',
+  isFalling: false,
+  grouping: 'none',
+};
+
+function fits(clip, wanted) {
+  return wanted.every((word) => clip.text.includes(word)) &&
+         filters.pressed.every((set, kind) => set.size === 0 ||
+                                              CHIP_KINDS[kind].of(clip).some((label) => set.has(label))) &&
+         (!filters.only || filters.only.numbers.has(clip.number));
+}
+
+// Clips in their order, with {group, count} before those of a group.
+function rowsToShow() {
+  const wanted = folded(filters.words).split(/\s+/).filter(Boolean);
+  const column = COLUMNS.find((one) => one.id === filters.sort);
+  const sign = filters.isFalling ? -1 : 1;
+  const found = clips.filter((clip) => fits(clip, wanted));
+  found.sort((a, b) => sign * column.order(a, b) || words.compare(a.name, b.name) || a.number - b.number);
+  const grouping = GROUPINGS.find((one) => one.id === filters.grouping);
+  if (!grouping.of) return found;
+  const groups = new Map();
+  for (const clip of found) {
+    const group = grouping.of(clip);
+    if (!groups.has(group)) groups.set(group, []);
+    groups.get(group).push(clip);
+  }
+  return [...groups].sort((a, b) => words.compare(a[0], b[0]))
+      .flatMap(([group, members]) => [{group, count: members.length}, ...members]);
+}
+
+function chips(changed) {
+  const box = el('div', {class: 'chips', role: 'group', 'aria-label': 'Filters'});
+  CHIP_KINDS.forEach((kind, place) => {
+    const counts = new Map();
+    for (const clip of clips) {
+      for (const label of new Set(kind.of(clip))) {
+        if (label) counts.set(label, (counts.get(label) || 0) + 1);
+      }
+    }
+    const most = [...counts].sort((a, b) => b[1] - a[1]).slice(0, MOST_CHIPS);
+    if (most.length === 0 || (most.length === 1 && place < 2)) return;
+    box.append(el("span", {class: "kind"}, kind.title), ...most.map(([label, count]) => {
+      const chip = el('button', {type: 'button', class: 'chip', 'aria-pressed': 'false'}, label,
+                      el('span', {class: 'count'}, count));
+      chip.addEventListener('click', () => {
+        const set = filters.pressed[place];
+        const isPressed = !set.has(label);
+        if (isPressed) set.add(label); else set.delete(label);
+        chip.setAttribute('aria-pressed', isPressed);
+        changed();
+      });
+      return chip;
+    }));
+  });
+  return box;
+}

@@ -1,0 +1,29 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// How loud a sound track is over its length.
+
+const FULL = 255;  // of a level
+
+function levelPath(levels) {
+  const up = levels.map((level, i) => i + ' ' + (FULL - level));
+  const down = levels.map((level, i) => i + ' ' + (FULL + level)).reverse();
+  return 'M' + [...up, ...down].join('L') + 'Z';
+}
+
+function waveform(wave, track) {
+  const highest = wave.highest === undefined ? 'silent' : 'highest ' + plain(wave.highest, 1) + '\u00a0dB';
+  const title = 'Sound track ' + wave.track +
+                (track ? ', ' + counted(track.channels || 0, 'channel') : '');
+  const width = Math.max(1, wave.peaks.length - 1);
+  const notes = [wave.isWhole ? '' : 'looked at in pieces', wave.lacksSamples ? 'parts can\u2019t be read' : '']
+      .filter(Boolean).join('; ');
+  return el('figure', {class: 'wave'},
+    el('figcaption', {}, el('span', {}, title),
+      el('span', {class: 'fine'}, highest + ', ' + durationText(wave.seconds) + (notes ? '; ' + notes : ''))),
+    svg('svg', {viewBox: '0 0 ' + width + ' ' + 2 * FULL, preserveAspectRatio: 'none', role: 'img',
+                'aria-label': title + ': ' + highest},
+      svg('path', {class: 'peak', d: levelPath(wave.peaks)}),
+      svg('path', {class: 'mean', d: levelPath(wave.means)}),
+      svg('line', {class: 'middle', x1: 0, x2: width, y1: FULL, y2: FULL, 'vector-effect': 'non-scaling-stroke'})));
+}

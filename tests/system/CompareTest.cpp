@@ -1,0 +1,288 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// What is told of two AAF files, and of movies against a file.
+
+#include <algorithm>
+#include <fstream>
+#include <functional>
+#include <nlohmann/json.hpp>
+
+#include "aaf_library/stored/StoredFile.h"
+#include "tests/system/Command.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+using Json = nlohmann::ordered_json;
+using aaf::stored::StoredObject;
+using aaf::stored::StoredProperty;
+
+class ComparedFiles : public SystemTest {
+protected:
+    std::string In(const std::string& name) { return Quoted(folder() / name); }
+
+    // A movie of the test's own; other lengths are other contents.
+    std::string Movie(const std::string& name, int frames, int sounds = 1) {
+        movies::Movie movie;
+        movie.tracks.push_back(movies::VideoTrack({}, frames, 25, 1));
+        for (int i = 0; i < sounds; ++i) {
+            movie.tracks.push_back(movies::SoundTrack({}, frames * 1920));
+        }
+        fs::create_directories((folder() / name).parent_path());
+        return Quoted(Write(movie, name));
+    }
+    void Describe(const std::string& movies, const std::string& output) {
+        const CommandResult done = RunCliphost("describe -q " + movies + " " + output);
+        ASSERT_EQ(done.status, 0) << done.out;
+    }
+    // Standard output alone.
+    CommandResult Answer(const std::string& arguments) {
+        return RunCommand(Quoted(ProgramFolder() / "cliphost") + " " + arguments + " 2>/dev/null");
+    }
+    // The words of all differences.
+    static std::vector<std::string> WordsOf(const Json& differences) {
+        std::vector<std::string> words;
+        for (const Json& one : differences) {
+            words.push_back(one["words"]);
+        }
+        return words;
+    }
+    // A file with one change in its stored tree.
+    void Edit(const std::string& from, const std::string& to,
+              const std::function<void(StoredProperty&)>& edit) {
+        StoredObject root;
+        ASSERT_TRUE(aaf::stored::LoadTree(folder() / from, root));
+        const std::function<void(StoredObject&)> walk = [&](StoredObject& object) {
+            for (StoredProperty& property : object.properties) {
+                edit(property);
+                std::for_each(property.objects.begin(), property.objects.end(), walk);
+            }
+        };
+        walk(root);
+        ASSERT_TRUE(aaf::stored::SaveTree(root, folder() / to, aaf::stored::SectorSize::Bytes512));
+    }
+};
+
+using CompareVerb = ComparedFiles;
+
+TEST_F(CompareVerb, FindsNothingBetweenTwoDescriptionsOfAMovie) {
+    const std::string movie = Movie("a.mov", 10);
+    Describe(movie, "--aaf " + In("a.aaf") + " --pin-time 2020-01-31T12:00:00Z");
+    Describe(movie, "--aaf " + In("b.aaf"));
+    const CommandResult compared = RunCliphost("compare " + In("a.aaf") + " " + In("b.aaf"));
+    EXPECT_EQ(compared.status, 0);
+    EXPECT_EQ(compared.out, "no differences: 3 objects alike\n");
+}
+
+TEST_F(CompareVerb, NeedsNoModule) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    EXPECT_EQ(
+        RunCliphost("--plugin /nowhere.nvx compare " + In("a.aaf") + " " + In("a.aaf")).status, 0);
+}
+
+// Another content is another mob, which is known by its name.
+TEST_F(CompareVerb, TellsInWordsWhatIsOtherInAMovieThatWasWrittenAnew) {
+    Describe(Movie("1/a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("2/a.mov", 11), "--aaf " + In("b.aaf"));
+    const CommandResult compared = RunCliphost("compare " + In("a.aaf") + " " + In("b.aaf"));
+    ExpectSays(compared, 1, "master mob \"a\"\n  mob id urn:smpte:umid:");
+    ExpectSays(compared, 1, "  picture slot 3: length 10 -> 11\n");
+    ExpectSays(compared, 1, "source mob \"a\" (MultipleDescriptor)\n");
+    ExpectSays(compared, 1, "  essence description: locator: url string ");
+    ExpectSays(compared, 1, ": 3 objects changed\n");
+    EXPECT_EQ(compared.out.find("source id"), std::string::npos)
+        << "what leads to a mob that is known leads there";
+}
+
+TEST_F(CompareVerb, HoldsTwoFilesOfOneClipAgainstEachOtherWhateverItsName) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("b.mov", 11), "--aaf " + In("b.aaf"));
+    const CommandResult compared = RunCliphost("compare " + In("a.aaf") + " " + In("b.aaf"));
+    ExpectSays(compared, 1, "  name \"a\" -> \"b\"\n");
+    ExpectSays(compared, 1, ": 3 objects changed\n");
+}
+
+TEST_F(CompareVerb, TellsWhatCameIntoABinAndWhatWent) {
+    const std::string a = Movie("in/a.mov", 10);
+    const std::string b = Movie("in/b.mov", 11);
+    const std::string c = Movie("in/c.mov", 12);
+    Describe(a + " " + b, "--bin " + In("old.aaf"));
+    Describe(b + " " + c, "--bin " + In("new.aaf"));
+    const CommandResult compared = RunCliphost("compare " + In("old.aaf") + " " + In("new.aaf"));
+    ExpectSays(compared, 1, "master mob \"a\" gone\n");
+    ExpectSays(compared, 1, "master mob \"c\" new\n");
+    ExpectSays(compared, 1, "6 differences: 3 objects alike, 3 objects gone, 3 objects new\n");
+    EXPECT_EQ(compared.out.find("\"b\""), std::string::npos) << compared.out;
+}
+
+TEST_F(CompareVerb, AnswersInJson) {
+    const std::string movie = Movie("in/a.mov", 10);
+    Describe(movie, "--aaf " + In("a.aaf"));
+    Describe(movie,
+             "--aaf " + In("b.aaf") + " --map " + Quoted((folder() / "in").string() + "=/nowhere"));
+    const CommandResult compared = Answer("compare --json " + In("a.aaf") + " " + In("b.aaf"));
+    EXPECT_EQ(compared.status, 1);
+    const Json answer = Json::parse(compared.out);
+    EXPECT_EQ(answer["beforeFile"], (folder() / "a.aaf").string());
+    EXPECT_EQ(answer["afterFile"], (folder() / "b.aaf").string());
+    ASSERT_EQ(answer["differences"].size(), 2u) << "the locators of two mobs";
+    for (const Json& one : answer["differences"]) {
+        EXPECT_EQ(one["object"]["class"], "SourceMob");
+        EXPECT_EQ(one["kind"], "changed");
+        EXPECT_EQ(one["property"], "URLString");
+        EXPECT_EQ(one["after"], "\"file:///nowhere/a.mov\"");
+    }
+    EXPECT_EQ(answer["counts"]["differences"], 2);
+    EXPECT_EQ(answer["counts"]["changed"], 2);
+    EXPECT_EQ(answer["counts"]["alike"], 1);
+    const Json same = Json::parse(Answer("compare --json " + In("a.aaf") + " " + In("a.aaf")).out);
+    EXPECT_EQ(same["differences"], Json::array());
+}
+
+// Of long values the first bytes are shown; the last ones count as well.
+TEST_F(CompareVerb, SeesADifferenceBehindWhatItShowsOfAValue) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    for (const char last : {1, 2}) {
+        Edit("a.aaf", last == 1 ? "1.aaf" : "2.aaf", [&](StoredProperty& property) {
+            if (property.pid == 0x4001) {  // of a locator, its URL; of an odd size it is none
+                property.bytes.assign(2001, 'x');
+                property.bytes.back() = static_cast<unsigned char>(last);
+            }
+        });
+    }
+    const CommandResult compared = RunCliphost("compare " + In("1.aaf") + " " + In("2.aaf"));
+    ExpectSays(compared, 1, "locator: url string ");
+    ExpectSays(compared, 1, "2001 in all, digest ");
+    EXPECT_EQ(RunCliphost("compare " + In("1.aaf") + " " + In("1.aaf")).status, 0);
+}
+
+TEST_F(CompareVerb, ShowsHostileTextsAsText) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    Edit("a.aaf", "odd.aaf", [](StoredProperty& property) {
+        if (property.pid == 0x4001) {
+            property.bytes = {'\x1B', 0, '[', 0, '2', 0, 'J', 0, '\n', 0, 0, 0};
+        }
+    });
+    const CommandResult compared = RunCliphost("compare " + In("a.aaf") + " " + In("odd.aaf"));
+    EXPECT_EQ(compared.status, 1);
+    EXPECT_EQ(compared.out.find('\x1B'), std::string::npos);
+    ExpectSays(compared, 1, "\\x1B[2J\\n");
+}
+
+TEST_F(CompareVerb, TellsWhichFileCanNotBeRead) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    std::ofstream(folder() / "text.aaf") << "not an AAF file";
+    const std::string good = In("a.aaf") + " ";
+    ExpectSays(RunCliphost("compare " + good + In("text.aaf")), 1,
+               "text.aaf: can't be read as AAF: AAFRESULT_NOT_AAF_FILE");
+    ExpectSays(RunCliphost("compare " + In("text.aaf") + " " + good), 1, "text.aaf: can't be read");
+    ExpectSays(RunCliphost("compare " + good + In("none.aaf")), 2, "there is no such file");
+    ExpectSays(RunCliphost("compare " + good + In("")), 2, "this is a folder; give an AAF file");
+    ExpectSays(RunCliphost("compare " + good), 2, "after is required");
+    const CommandResult json = Answer("compare --json " + good + In("text.aaf"));
+    EXPECT_EQ(json.status, 1);
+    EXPECT_EQ(Json::parse(json.out)["afterFile"], (folder() / "text.aaf").string());
+}
+
+TEST_F(CompareVerb, EndsWithADocumentedStatusOnDamagedFiles) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    const movies::Bytes whole = ReadFile(folder() / "a.aaf");
+    constexpr std::size_t kRuns = 40;
+    for (std::size_t run = 0; run < kRuns; ++run) {
+        movies::Bytes damaged = whole;
+        const std::size_t at = whole.size() * run / kRuns;
+        for (std::size_t i = 0; i < 16 && at + i * 37 < damaged.size(); ++i) {
+            damaged[at + i * 37] ^= 0xFF;
+        }
+        Write(damaged, "damaged.aaf");
+        const CommandResult compared =
+            RunCliphost("compare " + In("a.aaf") + " " + In("damaged.aaf"));
+        EXPECT_TRUE(compared.status == 0 || compared.status == 1) << compared.status;
+        EXPECT_FALSE(compared.out.empty());
+    }
+}
+
+using DescribeAgainst = ComparedFiles;
+
+TEST_F(DescribeAgainst, FindsNothingOtherThanBefore) {
+    const std::string movie = Movie("in/a.mov", 10);
+    Describe(movie, "--aaf " + In("a.aaf"));
+    const CommandResult again = RunCliphost("describe " + movie + " --against " + In("a.aaf"));
+    EXPECT_EQ(again.status, 0) << again.out;
+    EXPECT_EQ(again.out, (folder() / "in/a.mov").string() + "\nno differences: 3 objects alike\n");
+}
+
+TEST_F(DescribeAgainst, TellsOfABinWhateverTheJobs) {
+    Movie("in/a.mov", 10);
+    Movie("in/b.mov", 11);
+    Describe(In("in"), "--bin " + In("old.aaf"));
+    for (const char* const jobs : {"1", "2"}) {
+        const std::string call =
+            "describe " + In("in") + " --against " + In("old.aaf") + " --jobs " + std::string(jobs);
+        ExpectSays(RunCliphost(call), 0, "no differences: 6 objects alike\n");
+    }
+    Movie("in/b.mov", 12);
+    for (const char* const jobs : {"1", "2"}) {
+        const std::string call =
+            "describe " + In("in") + " --against " + In("old.aaf") + " --jobs " + std::string(jobs);
+        const CommandResult compared = RunCliphost(call);
+        ExpectSays(compared, 1, "picture slot 3: length 11 -> 12\n");
+        ExpectSays(compared, 1, ": 3 objects alike, 3 objects changed\n");
+        EXPECT_EQ(compared.out.find("MasterMob"), std::string::npos) << "no tree is shown";
+    }
+}
+
+TEST_F(DescribeAgainst, SavesTheNewBinToo) {
+    Movie("in/a.mov", 10);
+    Describe(In("in"), "--bin " + In("old.aaf"));
+    EXPECT_EQ(RunCliphost("describe " + In("in") + " --against " + In("old.aaf") + " --bin " +
+                          In("new.aaf"))
+                  .status,
+              0);
+    EXPECT_EQ(RunCliphost("compare " + In("old.aaf") + " " + In("new.aaf")).status, 0);
+    ExpectSays(RunCliphost("describe " + In("in") + " --against " + In("old.aaf") + " --bin " +
+                           In("old.aaf")),
+               2, "this is the file of --against");
+}
+
+TEST_F(DescribeAgainst, AnswersInJsonBehindTheMovies) {
+    const std::string movie = Movie("in/a.mov", 10);
+    Describe(movie, "--aaf " + In("a.aaf"));
+    Movie("in/a.mov", 12);
+    for (const char* const form : {"--json", "--jsonl"}) {
+        const CommandResult again =
+            Answer("describe " + movie + " " + form + " --against " + In("a.aaf"));
+        EXPECT_EQ(again.status, 1);
+        const std::size_t line = again.out.rfind('\n', again.out.size() - 2);
+        const Json last = *form && std::string(form) == "--jsonl"
+                              ? Json::parse(again.out.substr(line + 1))
+                              : Json::parse(again.out).back();
+        EXPECT_EQ(last["against"], (folder() / "a.aaf").string());
+        const std::vector<std::string> words = WordsOf(last["differences"]);
+        EXPECT_EQ(std::count(words.begin(), words.end(), "picture slot 3: length 10 -> 12"), 2)
+            << again.out;
+        EXPECT_EQ(last["counts"]["changed"], 3);
+    }
+}
+
+TEST_F(DescribeAgainst, TellsAFailureBeforeAnythingIsRead) {
+    const std::string movie = Movie("in/a.mov", 10);
+    const CommandResult none = RunCliphost("describe " + movie + " --against " + In("none.aaf"));
+    ExpectSays(none, 2, "none.aaf: there is no such file");
+    EXPECT_EQ(none.out.find("a.mov"), std::string::npos);
+    for (const char* const other : {"--aaf x.aaf", "--out-dir x", "--shard 1/2"}) {
+        EXPECT_EQ(
+            RunCliphost("describe " + movie + " --against x.aaf " + std::string(other)).status, 2);
+    }
+}
+
+TEST_F(DescribeAgainst, ComparesNothingWhereNoMovieIsDescribed) {
+    Describe(Movie("in/a.mov", 10), "--aaf " + In("a.aaf"));
+    std::ofstream(folder() / "b.mov") << "no movie at all";
+    ExpectSays(RunCliphost("describe " + In("b.mov") + " --against " + In("a.aaf")), 1,
+               "a.aaf: not compared: no movie was described");
+}
+
+}  // namespace

@@ -1,0 +1,335 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+
+// What `report` tells of movies, what it writes, and what becomes of it where it can't.
+
+#include <cmath>
+#include <fstream>
+#include <nlohmann/json.hpp>
+#include <set>
+#include <sstream>
+
+#include "reference_host/report/PageText.h"
+#include "tests/system/Command.h"
+#include "tests/system/SystemTest.h"
+
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+std::string TextOfFile(const std::filesystem::path& file) {
+    std::ostringstream text;
+    text << std::ifstream(file, std::ios::binary).rdbuf();
+    return text.str();
+}
+
+class Reports : public SystemTest {
+protected:
+    void Copy(const std::string& made, const std::string& name) {
+        std::filesystem::create_directories((folder() / name).parent_path());
+        std::filesystem::copy_file(MadeMovie(made), folder() / name,
+                                   std::filesystem::copy_options::overwrite_existing);
+    }
+    // The program in the test's folder; both streams.
+    CommandResult Run(const std::string& arguments) {
+        return RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
+                          " report " + arguments + " 2>&1");
+    }
+    // What is printed as JSON; what is told on standard error goes.
+    Json Report(const std::string& arguments) {
+        const CommandResult result =
+            RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
+                       " report --json " + arguments + " 2>/dev/null");
+        status = result.status;
+        const Json report = Json::parse(result.out, nullptr, false);
+        EXPECT_TRUE(report.is_object() && report.contains("clips")) << result.out.substr(0, 500);
+        return report;
+    }
+    Json ClipOf(const std::filesystem::path& movie, const std::string& options = "") {
+        const Json report = Report(Quoted(movie) + " " + options);
+        return report["clips"].size() == 1 ? report["clips"][0] : Json::object();
+    }
+    std::set<std::string> FilesIn(const std::string& name) {
+        std::set<std::string> files;
+        for (const auto& entry : std::filesystem::directory_iterator(folder() / name)) {
+            files.insert(entry.path().filename().string());
+        }
+        return files;
+    }
+
+    int status = -1;
+};
+
+std::set<std::string> TraitsOf(const Json& clip) {
+    std::set<std::string> ids;
+    for (const Json& trait : clip["traits"]) {
+        ids.insert(trait["id"].get<std::string>());
+    }
+    return ids;
+}
+
+std::string WordsOf(const Json& clip, const std::string& trait) {
+    for (const Json& one : clip["traits"]) {
+        if (one["id"] == trait) {
+            return one["words"];
+        }
+    }
+    return {};
+}
+
+TEST_F(Reports, TellWhatAMovieIs) {
+    const Json clip = ClipOf(MadeMovie("h264_with_aac.mov"));
+    EXPECT_EQ(status, 0);
+    EXPECT_EQ(clip["name"], "h264_with_aac");
+    EXPECT_EQ(clip["codecName"], "H.264");
+    EXPECT_EQ(clip["rate"], "25/1");
+    EXPECT_EQ(clip["length"], 10);
+    EXPECT_EQ(clip["seconds"], 0.4);
+    EXPECT_EQ(clip["channels"], 2);
+    EXPECT_EQ(clip["size"], std::filesystem::file_size(MadeMovie("h264_with_aac.mov")));
+    EXPECT_EQ(clip["failed"], false);
+    const Json& details = clip["details"];
+    EXPECT_EQ(details["tracks"].size(), 2u);
+    EXPECT_EQ(details["description"]["Mobs"].size(), 3u);
+    EXPECT_EQ(details["strip"]["frames"].size(), 10u);
+    EXPECT_EQ(details["waves"].size(), 1u);
+    EXPECT_FALSE(details["parameters"].empty());
+    EXPECT_FALSE(details["columns"].empty());
+}
+
+TEST_F(Reports, AreThoseOfOneProcessWhateverTheNumberOfProcesses) {
+    for (const char* const name : {"h264_with_aac", "rotated_270", "pcm_u8"}) {
+        Copy(std::string(name) + ".mov", std::string("in/") + name + ".mov");
+    }
+    std::ofstream(folder() / "in/none.mov") << std::string(1000, 'x');
+    Json one = Report("in --jobs 1");
+    Json two = Report("in --jobs 2");
+    for (Json* const report : {&one, &two}) {
+        report->erase("made");
+        for (Json& clip : (*report)["clips"]) {
+            for (Json& mob : clip["details"]["description"]["Mobs"]) {
+                mob.erase("CreationTime");
+                mob.erase("LastModified");
+            }
+        }
+    }
+    EXPECT_TRUE(one == two);
+    EXPECT_EQ(one["clips"].size(), 4u);
+}
+
+TEST_F(Reports, NumberFramesAsTheMovieDoes) {
+    const Json frames = ClipOf(MadeMovie("timecode_2997_drop.mov"))["details"]["strip"]["frames"];
+    ASSERT_FALSE(frames.empty());
+    EXPECT_EQ(frames[0]["frame"], 0);
+    EXPECT_EQ(frames[0]["timecode"], "01:00:00;00");
+}
+
+TEST_F(Reports, TurnPicturesAsTheMovieIsShown) {
+    const auto turned =
+        Make("-f lavfi -i testsrc2=size=320x180:rate=25:duration=0.2 -c:v mpeg4", "flat.mov");
+    ASSERT_EQ(RunCommand("ffmpeg -nostdin -v error -display_rotation 90 -i " + Quoted(turned) +
+                         " -c copy " + Quoted(folder() / "turned.mov") +
+                         " 2>&1; ffmpeg -nostdin "
+                         "-v error -y -i " +
+                         Quoted(turned) + " -c copy -metadata:s:v rotate=90 " +
+                         Quoted(folder() / "turned.mov"))
+                  .status,
+              0);
+    const Json poster = ClipOf(folder() / "turned.mov")["poster"];
+    EXPECT_LT(poster["width"].get<int>(), poster["height"].get<int>());
+    const Json flat = ClipOf(turned)["poster"];
+    EXPECT_GT(flat["width"].get<int>(), flat["height"].get<int>());
+    EXPECT_EQ(WordsOf(ClipOf(folder() / "turned.mov"), "rotated").substr(0, 10), "rotated by");
+}
+
+TEST_F(Reports, TellGroupsOfPicturesAndTheirSizes) {
+    const Json clip =
+        ClipOf(Make("-f lavfi -i testsrc2=size=64x64:rate=25:duration=0.8 -c:v mpeg4 "
+                    "-g 5 -bf 0 -sc_threshold 1000000000",
+                    "groups.mov"));
+    const Json track = clip["details"]["samples"]["tracks"][0];
+    EXPECT_EQ(track["samples"], 20);
+    EXPECT_EQ(track["groups"].dump(), R"({"count":4,"shortest":5,"longest":5,"mean":5.0})");
+    std::uint64_t sum = 0;
+    for (const Json& size : track["sizes"]) {
+        sum += size.get<std::uint64_t>();
+    }
+    EXPECT_EQ(sum, track["bytes"].get<std::uint64_t>());  // as many columns as samples
+}
+
+// FFmpeg's sine has an eighth of the most.
+TEST_F(Reports, TellHowLoudSoundIs) {
+    const Json wave =
+        ClipOf(Make("-f lavfi -i sine=frequency=440:sample_rate=48000:duration=1 -c:a "
+                    "pcm_s24be",
+                    "sine.mov"))["details"]["waves"][0];
+    EXPECT_NEAR(wave["highest"].get<double>(), -18.06, 0.02);
+    EXPECT_EQ(wave["peaks"].size(), 240u);
+    EXPECT_NEAR(wave["peaks"][100].get<int>(), 255 * std::sqrt(1 / 8.0), 1);
+    // A column holds no whole number of waves.
+    EXPECT_NEAR(wave["means"][100].get<int>(), 255 * std::sqrt(std::sqrt(0.5) / 8), 3);
+    EXPECT_NEAR(wave["seconds"].get<double>(), 1.0, 0.05);
+}
+
+TEST_F(Reports, TellSilence) {
+    const Json silent =
+        ClipOf(Make("-f lavfi -i anullsrc=r=48000:cl=mono -t 1 -c:a pcm_s16be", "s.mov"));
+    EXPECT_EQ(TraitsOf(silent).count("silent"), 1u);
+    EXPECT_FALSE(silent["details"]["waves"][0].contains("highest"));
+    EXPECT_EQ(TraitsOf(ClipOf(MadeMovie("h264_with_aac.mov"))).count("silent"), 0u);
+}
+
+TEST_F(Reports, TellWhyTheModuleServesMedia) {
+    EXPECT_EQ(WordsOf(ClipOf(MadeMovie("pcm_u8.mov")), "provider"),
+              "audio track 1: An audio bit rate of 8 was found but only bit rates of 16 and 24 are "
+              "natively supported.");
+    EXPECT_EQ(WordsOf(ClipOf(MadeMovie("prores_hq_1080i.mov")), "provider"), "");
+}
+
+TEST_F(Reports, TellWhatIsOddTogether) {
+    Copy("timecode_25.mov", "in/a.mov");
+    Copy("timecode_25.mov", "in/b.mov");
+    Copy("timecode_2997_drop.mov", "in/c.mov");
+    std::set<std::string> ids;
+    const Json report = Report("in");
+    for (const Json& finding : report["odd"]) {
+        ids.insert(finding["id"].get<std::string>());
+        if (finding["id"] == "copies") {
+            EXPECT_EQ(finding["groups"][0]["clips"].dump(), "[0,1]");
+        }
+    }
+    for (const char* const id : {"copies", "rates", "drop"}) {
+        EXPECT_EQ(ids.count(id), 1u) << id;
+    }
+}
+
+TEST_F(Reports, HoldMoviesThatCanNotBeDescribedWithTheReason) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    std::ofstream(folder() / "in/none.mov") << std::string(1000, 'x');
+    const Json report = Report("in absent.mov");
+    EXPECT_EQ(status, 2);
+    ASSERT_EQ(report["clips"].size(), 3u);
+    EXPECT_EQ(report["clips"][1]["failed"], true);
+    EXPECT_EQ(report["clips"][1]["name"], "none");
+    EXPECT_FALSE(report["clips"][1]["warnings"][0]["reason"].get<std::string>().empty());
+    EXPECT_FALSE(report["clips"][2].contains("size"));
+    EXPECT_EQ(report["odd"][0]["id"], "failed");
+}
+
+TEST_F(Reports, ShowWhatACatalogKnowsOfMoviesThatAreGone) {
+    Copy("h264_with_aac.mov", "in/a.mov");
+    Copy("pcm_u8.mov", "in/b.mov");
+    ASSERT_EQ(RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
+                         " catalog in -o c.sqlite --thumbnails")
+                  .status,
+              0);
+    std::filesystem::remove(folder() / "in/a.mov");
+    const Json report = Report("c.sqlite");
+    EXPECT_EQ(status, 2);
+    ASSERT_EQ(report["clips"].size(), 2u);
+    const Json& gone = report["clips"][0];
+    EXPECT_EQ(gone["failed"], true);
+    EXPECT_EQ(gone["codecName"], "H.264");
+    EXPECT_EQ(gone["poster"]["type"], "image/png");
+    EXPECT_EQ(gone["warnings"][0]["kind"], "failure");
+    EXPECT_EQ(gone["details"]["tracks"].size(), 2u);
+    EXPECT_EQ(report["clips"][1]["failed"], false);
+    EXPECT_EQ(report["clips"][1]["details"]["waves"].size(), 1u);
+}
+
+TEST_F(Reports, RefuseADatabaseThatIsNoCatalog) {
+    std::ofstream(folder() / "x.sqlite")
+        << std::string("SQLite format 3\0", 16) << std::string(84, '\0');
+    ExpectSays(Run("x.sqlite -o r.html"), 2, "x.sqlite: ");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+}
+
+TEST_F(Reports, TellPlacesAsAnotherMachineSeesThem) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    const Json clip =
+        ClipOf(folder() / "in/a.mov", "--map " + Quoted(folder() / "in") + "=//server/media");
+    EXPECT_EQ(status, 0);
+    EXPECT_EQ(clip["place"], "file://server/media/a.mov");
+    EXPECT_NE(clip["details"]["description"].dump().find("file://server/media/a.mov"),
+              std::string::npos);
+    ExpectSays(Run("in -o r.html --map /elsewhere=/x"), 2, "nothing was mapped by it");
+}
+
+TEST_F(Reports, MakeNoMarkupOfNames) {
+    const std::string evil = "<script>alert(1)<!-- \"'& \x1b[31m\n\xE2\x80\xA8.mov";
+    Copy("pcm_u8.mov", "in/" + evil);
+    Copy("pcm_u8.mov", "in/no utf-8 \xff.mov");
+    ExpectSays(Run("in -o r.html --title '</title><script>alert(2)</script>'"), 0,
+               "r.html: 2 clips");
+    const std::string page = TextOfFile(folder() / "r.html");
+    EXPECT_EQ(page.find("<script>alert"), std::string::npos);
+    EXPECT_EQ(page.find("<!--"), std::string::npos);
+    EXPECT_EQ(page.find("\xE2\x80\xA8"), std::string::npos);
+    EXPECT_EQ(page.find('\xff'), std::string::npos);
+    EXPECT_NE(page.find("\\u003cscript\\u003ealert(1)"), std::string::npos);
+    const Json clips = Report("in")["clips"];
+    EXPECT_EQ(clips[0]["path"], (folder() / "in" / evil).string());
+    EXPECT_EQ(clips[1]["path"].get<std::string>().substr(0, 7), "file://");
+}
+
+TEST_F(Reports, PutPicturesIntoAFolderBesideThePage) {
+    Copy("h264_with_aac.mov", "in/a.mov");
+    Copy("rotated_270.mov", "in/b.mov");
+    ExpectSays(Run("in -o 'my report.html' --split"), 0, "2 clips");
+    const std::set<std::string> both = {"00000-poster.webp", "00000-strip.webp",
+                                        "00001-poster.webp", "00001-strip.webp"};
+    EXPECT_EQ(FilesIn("my report_files"), both);
+    EXPECT_EQ(TextOfFile(folder() / "my report_files/00000-poster.webp").substr(8, 4), "WEBP");
+    const std::string page = TextOfFile(folder() / "my report.html");
+    EXPECT_EQ(page.find("\"data\":\""), std::string::npos);
+    EXPECT_NE(page.find("my%20report_files/00000-poster.webp"), std::string::npos);
+    // What an earlier page had more goes.
+    ExpectSays(Run("in/a.mov -o 'my report.html' --split"), 0, "1 clip");
+    EXPECT_EQ(FilesIn("my report_files").size(), 2u);
+}
+
+TEST_F(Reports, GoToStandardOutputWhole) {
+    const CommandResult result = RunCommand(Quoted(ProgramFolder() / "cliphost") + " report " +
+                                            Quoted(MadeMovie("pcm_u8.mov")) + " -o - 2>/dev/null");
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(result.out.substr(0, 15), "<!doctype html>");
+    EXPECT_EQ(result.out.substr(result.out.size() - 8), "</html>\n");
+}
+
+TEST_F(Reports, AreNotWrittenWhereThereIsNoMovie) {
+    std::filesystem::create_directory(folder() / "empty");
+    const CommandResult result = Run("empty -o r.html");
+    EXPECT_NE(result.status, 0);
+    EXPECT_NE(result.out.find("r.html: not written"), std::string::npos) << result.out;
+    EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+}
+
+TEST_F(Reports, RefuseCallsThatCanNotBeMeant) {
+    Copy("pcm_u8.mov", "a.mov");
+    ExpectSays(Run("a.mov"), 2, "give -o FILE.html, or --json");
+    ExpectSays(Run("-o r.html"), 2, "--files-from");
+    ExpectSays(Run("a.mov -o - --split"), 2, "give -o FILE.html");
+    ExpectSays(Run("a.mov -o a.mov"), 2, "a.mov");
+    EXPECT_EQ(ReadFile(folder() / "a.mov"), ReadFile(MadeMovie("pcm_u8.mov")));
+    ExpectSays(Run("a.mov -o absent/r.html"), 2, "absent");
+    std::ofstream(folder() / "r_files") << "a file";
+    ExpectSays(Run("a.mov -o r.html --split"), 2, "r_files");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+}
+
+TEST_F(Reports, TellWhichPartOfAMovieCanNotBeRead) {
+    std::string movie = TextOfFile(MadeMovie("png.mov"));
+    const std::string code = "png ";
+    for (std::size_t at = movie.find(code); at != std::string::npos; at = movie.find(code, at)) {
+        movie.replace(at, code.size(), "xyz1");
+    }
+    std::ofstream(folder() / "a.mov", std::ios::binary) << movie;
+    const Json clip = ClipOf(folder() / "a.mov");
+    EXPECT_EQ(clip["failed"], false);
+    EXPECT_FALSE(clip.contains("poster"));
+    ASSERT_EQ(clip["warnings"].size(), 1u);
+    EXPECT_EQ(clip["warnings"][0]["kind"], "pictures");
+    EXPECT_NE(clip["warnings"][0]["reason"].get<std::string>().find("xyz1"), std::string::npos);
+}
+
+}  // namespace

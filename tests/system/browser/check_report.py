@@ -1,0 +1,287 @@
+#!/usr/bin/python3
+# Copyright (c) 2026 The Cliphost authors
+# SPDX-License-Identifier: MIT
+"""check_report.py CLIPHOST MOVIES WORK
+
+Opens reports in Chromium and does what people do there. WORK is a folder that stays: what npm installs.
+Ends with status 77 where there is no browser.
+"""
+
+import shutil
+import subprocess
+import sys
+import tempfile
+import unittest
+from pathlib import Path
+
+sys.dont_write_bytecode = True  # the modules lie in the sources
+import browser  # noqa: E402
+import pages  # noqa: E402
+
+HERE = Path(__file__).resolve().parent
+VIEWS = ("", "#/clip/1", "#/clip/8", "#/odd")
+WIDTHS = (360, 1440, 3840)
+NAMES = "tr.clip a.open"
+
+
+def axe_script(work):
+    """The script of axe-core, and why there is none."""
+    script = work / "node_modules/axe-core/axe.min.js"
+    if not script.exists():
+        if not shutil.which("npm"):
+            return "", "there is no npm, which axe-core comes by"
+        work.mkdir(parents=True, exist_ok=True)
+        for name in ("package.json", "package-lock.json"):
+            shutil.copyfile(HERE / name, work / name)
+        done = subprocess.run(["npm", "ci", "--no-audit", "--no-fund"], cwd=work, capture_output=True, encoding="utf-8")
+        if done.returncode != 0:
+            return "", f"npm can't install axe-core: {done.stderr.strip()[-300:]}"
+    return script.read_text(encoding="utf-8"), ""
+
+
+class ReportInBrowser(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        cls.page = browser.start()
+        cls.addClassCleanup(cls.page.quit)
+
+    def open(self, *arguments, **named):
+        self.page.open(self.report, *arguments, **named)
+
+    def names(self):
+        return self.page.texts(NAMES)
+
+    def test_opens_without_a_complaint_and_asks_for_nothing(self):
+        for view in VIEWS:
+            self.open(view)
+            self.page.frame()
+            self.assertEqual(self.page.complaints(), [])
+            other = [url for url in self.page.requests() if not url.startswith(("data:", "about:"))]
+            self.assertEqual({url.split("#")[0] for url in other}, {self.report.as_uri()})
+
+    def test_shows_hostile_names_as_text(self):
+        self.open()
+        names = self.names()
+        self.assertIn(pages.HOSTILE.replace("\x1b", "\u241b").replace("\n", "\u240a"), names)
+        self.assertIn(pages.TURNED.replace("\u202e", "\u2039U+202E\u203a"), names)
+        self.assertIn(pages.ARABIC, names)
+        for view in VIEWS:
+            self.open(view)
+            self.assertEqual(self.page.run("return [typeof hacked, document.querySelectorAll('[onerror]').length]"),
+                             ["undefined", 0])
+        self.assertEqual(self.page.run("return document.querySelectorAll('bdi').length > 5"), True)
+
+    def test_sorts_by_every_column_both_ways(self):
+        self.open(width=3840)
+        for column in self.page.run("return [...document.querySelectorAll('thead th')].map((one) => one.dataset.column)"):
+            selector = f'thead th[data-column="{column}"]'
+            orders = []
+            for _ in range(2):
+                self.page.click(selector + " button")
+                orders.append((self.page.one(selector).get_attribute("aria-sort"), self.names()))
+            directions = {direction for direction, _ in orders}
+            self.assertEqual(directions, {"ascending", "descending"}, column)
+            self.assertCountEqual(orders[0][1], orders[1][1])
+        clips = {clip["name"]: clip for clip in pages.document(self.report.read_text(encoding="utf-8"))["clips"]}
+        self.page.click('thead th[data-column="size"] button')
+        if self.page.one('thead th[data-column="size"]').get_attribute("aria-sort") == "descending":
+            self.page.click('thead th[data-column="size"] button')
+        files = self.page.texts("td.size")
+        sizes = sorted(clip["size"] for clip in clips.values())
+        self.assertEqual(len(files), len(sizes))
+        self.assertTrue(files[0].startswith(str(sizes[0])[:1]), files)
+
+    def test_searches_as_one_types(self):
+        self.open()
+        search = self.page.one("#search")
+        for typed, expected in (("timecode_", 2), ("29", 1), ("zzz", 0)):
+            search.send_keys(typed)
+            self.page.frame()
+            self.assertEqual(len(self.names()), expected, typed)
+        self.assertTrue(self.page.one(".nothing").is_displayed())
+        self.page.click(".nothing button")
+        self.assertEqual(len(self.names()), self.count)
+        search.send_keys("PRORES 1080")
+        self.page.frame()
+        self.assertEqual(self.names(), ["prores_hq_1080i"])
+
+    def test_filters_by_chips(self):
+        self.open()
+        self.page.click(".chip", "Not described")
+        self.assertEqual(self.names(), ["none"])
+        self.assertEqual([one.text for one in self.page.all('.chip[aria-pressed="true"]')], ["Not described1"])
+        self.page.click(".chip", "Rotated")
+        self.assertCountEqual(self.names(), ["none", "rotated_270"])
+        self.page.click(".reset")
+        self.assertEqual(len(self.names()), self.count)
+        self.assertEqual(self.page.all('.chip[aria-pressed="true"]'), [])
+
+    def test_groups_by_folder(self):
+        self.open(height=3000)
+        self.page.run("const by = document.querySelector('#group'); by.value = 'folder';"
+                      "by.dispatchEvent(new Event('change'))")
+        self.page.frame()
+        groups = self.page.texts("tr.group bdi")
+        self.assertEqual([Path(group).name for group in groups], ["day 1", "day 2"])
+        self.assertEqual(len(self.names()), self.count)
+
+    def test_opens_a_clip_and_comes_back_to_it(self):
+        self.open()
+        name = self.names()[3]
+        self.page.click(NAMES, name)
+        self.assertEqual(self.page.texts("h1"), [name])
+        self.assertEqual(self.page.focused(), name)
+        self.page.driver.back()
+        self.page.frame()
+        self.assertEqual(self.page.focused(), name)
+
+    def test_shows_all_of_a_clip(self):
+        self.open()
+        self.page.click(NAMES, "h264_with_aac")
+        self.assertEqual(self.page.texts(".part > h2"), ["Worth a look", "Pictures", "Sound", "Facts", "Bin columns",
+                                                         "Parameters", "Samples in the file", "Mobs"])
+        self.assertEqual(len(self.page.all(".strip .cell img")), 10)  # as many as it has frames
+        self.assertEqual(len(self.page.all(".wave path.peak")), 1)
+        self.assertEqual(self.page.texts(".mob > h3"), ["Master mob", "File mob", "Source mob"])
+        self.page.frame()
+        slots = len(self.page.all(".slot[data-target]"))
+        self.assertGreater(slots, 3)
+        self.assertEqual(len(self.page.all(".arrows .arrow")), slots)
+        self.page.click(".mob summary", "Descriptor")
+        self.assertIn("CDCIDescriptor", " ".join(self.page.texts(".node summary")))
+
+    def test_tells_why_a_clip_failed(self):
+        self.open()
+        self.page.click(NAMES, "none")
+        told = self.page.one(".warning.bad").text
+        self.assertIn("can't be opened", told)
+        self.assertEqual(len(self.page.all(".placeholder")), 1)
+
+    def test_walks_with_the_keyboard(self):
+        keys = browser.Keys
+        self.open()
+        self.page.run("document.querySelector('.chip:last-child').focus()")
+        for _ in range(30):
+            self.page.keys(keys.TAB)
+            if self.page.run("return document.activeElement.matches('a.open')"):
+                break
+        names = self.names()
+        self.assertEqual(self.page.focused(), names[0])
+        self.page.keys(keys.ARROW_DOWN, keys.ARROW_DOWN)
+        self.assertEqual(self.page.focused(), names[2])
+        self.page.keys(keys.END)
+        self.assertEqual(self.page.focused(), names[-1])
+        self.page.keys(keys.HOME, keys.ARROW_DOWN, keys.ENTER)
+        self.assertEqual(self.page.texts("h1"), [names[1]])
+        self.page.keys("j")
+        self.assertEqual(self.page.texts("h1"), [names[2]])
+        self.page.keys("k", "k")
+        self.assertEqual(self.page.texts("h1"), [names[0]])
+        self.page.keys(keys.ESCAPE)
+        self.assertEqual(self.page.focused(), names[0])
+        self.page.keys("/")
+        self.assertEqual(self.page.run("return document.activeElement.id"), "search")
+
+    def test_copies_a_value_by_click_and_by_key(self):
+        self.page.command("Browser.grantPermissions", permissions=["clipboardReadWrite", "clipboardSanitizedWrite"])
+        self.open("#/clip/1")
+        read = "const done = arguments[0]; navigator.clipboard.readText().then(done, (error) => done(String(error)))"
+        path = self.page.all(".facts .value")[0]
+        path.click()
+        self.page.frame()
+        self.assertEqual(self.page.wait(read), path.text)
+        self.assertIn(path.text, self.page.one(".told").text)
+        self.page.keys(browser.Keys.ARROW_DOWN, browser.Keys.ENTER)
+        self.assertNotEqual(self.page.wait(read), path.text)
+
+    def test_changes_the_theme(self):
+        paper = "return getComputedStyle(document.documentElement).backgroundColor"
+        self.open()
+        self.page.run("try { localStorage.clear() } catch {}")
+        self.open()
+        light = self.page.run(paper)
+        self.open(scheme="dark")
+        dark = self.page.run(paper)
+        self.assertNotEqual(light, dark)
+        self.page.click(".theme")
+        self.assertEqual((self.page.run(paper), self.page.one(".theme").text), (light, "Theme: light"))
+        self.page.click(".theme")
+        self.assertEqual(self.page.run(paper), dark)
+        self.page.click(".theme")
+        self.assertEqual(self.page.one(".theme").text, "Theme: system")
+
+    def test_fits_screens_of_all_widths(self):
+        for width in WIDTHS:
+            for view in VIEWS:
+                self.open(view, width=width)
+                self.assertEqual(self.page.run("return document.documentElement.scrollWidth"), width, view)
+
+    def test_names_what_is_odd_and_leads_to_it(self):
+        self.open("#/odd")
+        titles = self.page.texts(".finding h2")
+        for title in ("Not described", "Copies of one movie", "Mixed rates", "Drop and non-drop"):
+            self.assertTrue(any(title in one for one in titles), titles)
+        self.page.click(".finding .chip", "copies")
+        self.assertEqual(len(self.names()), 2)
+        self.page.click(".reset")
+        self.assertEqual(len(self.names()), self.count)
+
+    def test_keeps_few_rows_of_many_and_shows_each(self):
+        self.page.open(self.many)
+        self.assertLess(len(self.names()), 60)
+        self.assertEqual(self.page.one("table.clips").get_attribute("aria-rowcount"), "1001")
+        self.page.run("scrollTo(0, document.body.scrollHeight)")
+        self.page.frame()
+        self.assertEqual(self.names()[-1], "clip 00999")
+        self.page.run("scrollTo(0, 0)")
+        self.page.frame()
+        self.assertEqual(self.names()[0], "clip 00000")
+        self.page.run("document.querySelector('a.open').focus()")
+        self.page.keys(browser.Keys.END)
+        self.assertEqual(self.page.focused(), "clip 00999")
+
+    def test_prints_all_rows(self):
+        self.page.open(self.many)
+        self.page.run("dispatchEvent(new Event('beforeprint'))")
+        self.assertEqual(len(self.names()), 1000)
+        self.page.run("dispatchEvent(new Event('afterprint'))")
+        self.assertLess(len(self.names()), 60)
+
+    def test_shows_pictures_that_lie_beside_it(self):
+        self.page.open(self.split, "#/clip/1")
+        self.assertEqual(self.page.complaints(), [])
+        loaded = ("const done = arguments[0]; Promise.all([...document.images].map((one) => one.decode()))"
+                  ".then(() => done(document.images.length), (error) => done(String(error)))")
+        self.assertEqual(self.page.wait(loaded), 10)
+
+    def test_is_accessible_by_axe(self):
+        if not self.axe:
+            self.skipTest(self.no_axe)
+        for width in (360, 1440):
+            for scheme in ("light", "dark"):
+                for view in VIEWS:
+                    self.open(view, width=width, scheme=scheme)
+                    self.page.run(self.axe)
+                    found = self.page.wait("const done = arguments[0]; axe.run().then((all) => done(all.violations))")
+                    self.assertEqual([(one["id"], one["nodes"][0]["html"]) for one in found], [], (width, scheme, view))
+
+
+def main(program, movies, work):
+    reason = browser.why_none()
+    if reason:
+        print(f"skipped: {reason}")
+        return browser.SKIPPED
+    with tempfile.TemporaryDirectory() as folder:
+        folder = Path(folder)
+        pages.make_movies(Path(movies), folder / "movies")
+        ReportInBrowser.report = pages.write(program, folder / "movies", folder / "report.html")
+        ReportInBrowser.split = pages.write(program, folder / "movies", folder / "split.html", "--split")
+        ReportInBrowser.many = pages.multiply(ReportInBrowser.report, 1000, folder / "many.html")
+        ReportInBrowser.count = len(pages.document(ReportInBrowser.report.read_text(encoding="utf-8"))["clips"])
+        ReportInBrowser.axe, ReportInBrowser.no_axe = axe_script(Path(work))
+        result = unittest.main(argv=sys.argv[:1], exit=False, verbosity=2).result
+    return 0 if result.wasSuccessful() else 1
+
+
+if __name__ == "__main__":
+    sys.exit(main(*sys.argv[1:]))

@@ -1,0 +1,92 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/cliphost/ReportOdd.h"
+
+#include <gtest/gtest.h>
+
+#include <nlohmann/json.hpp>
+
+using cliphost::OddThings;
+using Json = nlohmann::ordered_json;
+
+namespace {
+
+Json Clip(Json facts) {
+    for (const char* const list : {"traits", "warnings"}) {
+        facts.emplace(list, Json::array());
+    }
+    return facts;
+}
+
+// "rates: 24/1 0 2, 25/1 1" for each finding.
+std::string Told(const Json& clips) {
+    std::string text;
+    for (const Json& finding : OddThings(clips)) {
+        text += (text.empty() ? "" : "; ") + finding["id"].get<std::string>() + ":";
+        for (const Json& group : finding["groups"]) {
+            text +=
+                (&group == &finding["groups"][0] ? " " : ", ") + group["label"].get<std::string>();
+            for (const Json& number : group["clips"]) {
+                text += " " + std::to_string(number.get<int>());
+            }
+        }
+    }
+    return text;
+}
+
+TEST(OddThingsOfClips, AreNoneWhereAllAreAlike) {
+    const Json clip = Clip({{"rate", "25/1"},
+                            {"width", 16},
+                            {"colors", "Rec. 709 (1-1-1)"},
+                            {"hasTimecode", true},
+                            {"drop", false}});
+    EXPECT_EQ(Told(Json::array({clip, clip, clip})), "");
+    EXPECT_EQ(Told(Json::array()), "");
+}
+
+TEST(OddThingsOfClips, TellMixedRatesWithTheClipsOfEach) {
+    EXPECT_EQ(Told({Clip({{"rate", "24/1"}}), Clip({{"rate", "25/1"}}), Clip({{"rate", "24/1"}}),
+                    Clip({{"name", "without"}})}),
+              "rates: 24/1 0 2, 25/1 1");
+}
+
+TEST(OddThingsOfClips, TellMixedColoursOfPicturesAlone) {
+    EXPECT_EQ(Told({Clip({{"width", 1}, {"colors", "a"}}), Clip({{"width", 1}}),
+                    Clip({{"channels", 2}})}),
+              "colors: a 0, not told 1");
+}
+
+TEST(OddThingsOfClips, TellDropBesideNonDropOfThoseWithTimecode) {
+    EXPECT_EQ(Told({Clip({{"hasTimecode", true}, {"drop", true}}),
+                    Clip({{"hasTimecode", true}, {"drop", false}})}),
+              "drop: drop-frame 0, non-drop 1");
+    EXPECT_EQ(Told({Clip({{"hasTimecode", true}, {"drop", true}}),
+                    Clip({{"hasTimecode", false}, {"drop", false}})}),
+              "");
+}
+
+TEST(OddThingsOfClips, TellCopiesByTheirContent) {
+    EXPECT_EQ(Told({Clip({{"id", "x"}}), Clip({{"id", "y"}}), Clip({{"id", "x"}})}),
+              "copies: x 0 2");
+    EXPECT_EQ(Told({Clip({{"id", "x"}}), Clip({{"id", "y"}})}), "");
+}
+
+TEST(OddThingsOfClips, TellTraitsByTheirWordsAndEachClipOnce) {
+    const auto edits = [](const char* words) { return Json{{"id", "edits"}, {"words", words}}; };
+    const Json two = {edits("a"), edits("b"), edits("a")};
+    EXPECT_EQ(Told({Clip({{"traits", two}}), Clip({{"traits", Json::array({edits("b")})}})}),
+              "edits: a 0, b 0 1");
+}
+
+TEST(OddThingsOfClips, TellFailuresAndDoubtsApart) {
+    const auto told = [](const char* kind) {
+        return Json::array({{{"kind", kind}, {"reason", "r"}}});
+    };
+    EXPECT_EQ(Told({Clip({{"failed", true}, {"warnings", told("failure")}}),
+                    Clip({{"failed", false}, {"warnings", told("doubt")}}),
+                    Clip({{"failed", false}, {"warnings", told("sound")}})}),
+              "failed: not described 0; doubt: a part can't be read 2, the header tells something "
+              "wrong 1");
+}
+
+}  // namespace

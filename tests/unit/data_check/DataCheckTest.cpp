@@ -1,0 +1,395 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/data_check/DataCheck.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <map>
+
+#include "tests/support/TestFolder.h"
+
+namespace {
+
+using data_check::CheckedData;
+using data_check::Finding;
+using ::testing::AllOf;
+using ::testing::Contains;
+using ::testing::ElementsAre;
+using ::testing::HasSubstr;
+using ::testing::IsEmpty;
+using Texts = std::vector<std::string>;
+
+// Each on one line as "file:line:column: what; what helps".
+Texts TextsOf(const CheckedData& checked) {
+    Texts texts;
+    for (const Finding& finding : checked.findings) {
+        texts.push_back(
+            std::string(data_check::kDataFileNames[static_cast<std::size_t>(finding.file)]) + ":" +
+            std::to_string(finding.place.line) + ":" + std::to_string(finding.place.column) + ": " +
+            finding.what + "; " + finding.hint);
+    }
+    return texts;
+}
+
+class DataChecks : public testing::Test {
+protected:
+    using Values = std::map<std::string, std::string>;
+
+    // Values that leave nothing to be found.
+    static Values Good() {
+        return {{"rp210:PictureEssenceCoding", "060e2b34-0401010d-04010202-03060400"},
+                {"rp210:EssenceContainerLabel", "060e2b34-0401010d-0d010301-021c0100"},
+                {"rp210:FrameLayout", "0"},
+                {"rp210:StoredWidth", "720"},
+                {"rp210:StoredHeight", "480"},
+                {"rp210:ComponentDepth", "10"},
+                {"rp210:HorizontalSubsampling", "2"},
+                {"rp210:VerticalSubsampling", "1"},
+                {"rp210:ColorSiting", "0"},
+                {"rp210:ColorRange", "897"},
+                {"rp210:BlackRefLevel", "64"},
+                {"rp210:WhiteReflevel", "940"}};
+    }
+    static Values With(const std::string& name, const std::string& value) {
+        Values values = Good();
+        values["rp210:" + name] = value;
+        return values;
+    }
+    static Values Sized(const std::string& width, const std::string& height) {
+        Values values = Good();
+        values["rp210:StoredWidth"] = width;
+        values["rp210:StoredHeight"] = height;
+        return values;
+    }
+    static std::string Record(
+        const Values& values, const std::string& id = "10000", const std::string& kind = "CDCI",
+        const std::string& more =
+            "<rp210:VideoLineMap><rp210:Element>23</rp210:Element></rp210:VideoLineMap>",
+        const std::string& aspect = "types:Numerator='4' types:Denominator='3'") {
+        std::string text = "<MediaDescriptorSignature><NivoInfo ResolutionID='" + id +
+                           "'/><groups:" + kind + "Descriptor";
+        for (const auto& [name, value] : values) {
+            text += " " + name + "='" + value + "'";
+        }
+        return text + "><rp210:AspectRatio " + aspect + "/>" + more + "</groups:" + kind +
+               "Descriptor></MediaDescriptorSignature>\n";
+    }
+    static std::string Row(const std::string& code, const std::string& more) {
+        return "<FourCharMapping FourChar='" + code + "' " + more + "/>\n";
+    }
+    CheckedData CheckFiles(const std::string& mapper, const std::string& infos) {
+        folder_.Write("FourCharMapper.xml", mapper);
+        folder_.Write("AAFInfo.xml", infos);
+        return data_check::CheckData(folder_.path());
+    }
+    Texts Check(const std::string& records, const std::string& rows = Row("dvc ", "vcid='10000'")) {
+        return TextsOf(CheckFiles("<Map>\n" + rows + "</Map>", "<Infos>\n" + records + "</Infos>"));
+    }
+    const TestFolder folder_;
+};
+
+TEST_F(DataChecks, FindNothingInTheShippedFiles) {
+    const CheckedData checked = data_check::CheckData(SHIPPED_DATA_FOLDER);
+    EXPECT_THAT(TextsOf(checked), IsEmpty());
+    EXPECT_EQ(checked.counts.findings, 0u);
+    EXPECT_GT(checked.counts.codes, 50u);
+    EXPECT_GE(checked.counts.rows, checked.counts.codes);
+    EXPECT_GT(checked.counts.ids, 50u);
+    EXPECT_GE(checked.counts.records, checked.counts.ids);
+}
+
+TEST_F(DataChecks, FindNothingInAGoodPair) {
+    EXPECT_THAT(Check(Record(Good())), IsEmpty());
+}
+
+TEST_F(DataChecks, TellWhereAMistakeIsAndWhatHelps) {
+    EXPECT_THAT(CheckFiles("<Map>\n  <FourCharMapping FourChar='dvc '\n      vcid='0'/>\n</Map>",
+                           "<Infos>\n" + Record(Good()) + "</Infos>")
+                    .findings.size(),
+                1u);
+    const Texts texts =
+        TextsOf(CheckFiles("<Map>\n  <FourCharMapping FourChar='dvc '\n      vcid='0'/>\n</Map>",
+                           "<Infos>\n" + Record(Good()) + "</Infos>"));
+    EXPECT_THAT(texts, ElementsAre("FourCharMapper.xml:3:7: vcid can't be \"0\"; give a whole "
+                                   "number above 0, or leave it out"));
+}
+
+TEST_F(DataChecks, FindValuesThatAnAafLibraryRefuses) {
+    for (const auto& [name, value] :
+         std::vector<std::pair<std::string, std::string>>{{"ColorSiting", "5"},
+                                                          {"ColorSiting", "256"},
+                                                          {"HorizontalSubsampling", "3"},
+                                                          {"HorizontalSubsampling", "0"},
+                                                          {"VerticalSubsampling", "4"},
+                                                          {"FrameLayout", "5"},
+                                                          {"StoredHeight", "0"},
+                                                          {"DisplayWidth", "0"},
+                                                          {"ComponentDepth", "17"},
+                                                          {"ColorRange", "x"},
+                                                          {"ColorRange", "4294967296"},
+                                                          {"ColorRange", "0897"},
+                                                          {"BlackRefLevel", "-1"}}) {
+        EXPECT_THAT(Check(Record(With(name, value))),
+                    Contains(HasSubstr("rp210:" + name + " can't be \"" + value + "\"; give ")));
+    }
+}
+
+TEST_F(DataChecks, AcceptTheRestOfTheirRanges) {
+    for (const auto& [name, value] :
+         std::vector<std::pair<std::string, std::string>>{{"ColorSiting", "4"},
+                                                          {"ColorSiting", "255"},
+                                                          {"HorizontalSubsampling", "4"},
+                                                          {"VerticalSubsampling", "2"},
+                                                          {"FrameLayout", "4"}}) {
+        EXPECT_THAT(Check(Record(With(name, value))), IsEmpty()) << name << value;
+    }
+}
+
+TEST_F(DataChecks, FindEveryValueThatARecordMustHave) {
+    for (const auto& value : Good()) {
+        Values values = Good();
+        values.erase(value.first);
+        EXPECT_THAT(Check(Record(values)),
+                    Contains(HasSubstr("groups:CDCIDescriptor lacks " + value.first)));
+    }
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI", "")),
+                Contains(HasSubstr("lacks rp210:VideoLineMap")));
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI", "<rp210:VideoLineMap/>")),
+                Contains(HasSubstr("rp210:VideoLineMap must have one or two line numbers")));
+    EXPECT_THAT(
+        Check(Record(Good(), "10000", "MPEG2Video")),
+        AllOf(Contains(HasSubstr("lacks rp210:BitRate")), Contains(HasSubstr("lacks rp210:MaxGOP")),
+              Contains(HasSubstr("lacks rp210:ProfileAndLevel"))));
+    EXPECT_THAT(Check(Record(Good(), "10000", "RGBA")),
+                AllOf(Contains(HasSubstr("lacks rp210:ComponentMaxRef")),
+                      Contains(HasSubstr("lacks rp210:PixelLayout"))));
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI", "", "types:Numerator='0'")),
+                AllOf(Contains(HasSubstr("types:Numerator can't be \"0\"")),
+                      Contains(HasSubstr("rp210:AspectRatio lacks types:Denominator"))));
+}
+
+TEST_F(DataChecks, FindLayoutsWithTooManyComponentsAndLongCodes) {
+    std::string components;
+    for (int i = 0; i < 9; ++i) {
+        components += "<rp210:RGBALayout rp210:Code='RG' rp210:Depth='65'/>";
+    }
+    EXPECT_THAT(Check(Record(Good(), "10000", "RGBA",
+                             "<rp210:PixelLayout>" + components + "</rp210:PixelLayout>")),
+                AllOf(Contains(HasSubstr("rp210:PixelLayout has 9 components")),
+                      Contains(HasSubstr("rp210:Code is more than one letter")),
+                      Contains(HasSubstr("rp210:Depth can't be \"65\""))));
+}
+
+TEST_F(DataChecks, FindLabelsThatComeOutWrong) {
+    for (const char* const label :
+         {"{edb35383-6d30-11d3-a036-006094eb75cb}", "060e2b34-0401010d-04010202-030604",
+          "060e2b34-0401010d-04010202-0306040g"}) {
+        EXPECT_THAT(Check(Record(With("PictureEssenceCoding", label))),
+                    Contains(HasSubstr("rp210:PictureEssenceCoding is no universal label")));
+    }
+    EXPECT_THAT(Check(Record(With("EssenceContainerLabel", "060e2b34-0401010d-04810202-03060400"))),
+                Contains(HasSubstr("has a byte of 80h or more in its second half")));
+}
+
+TEST_F(DataChecks, FindAProfileThatWouldBePassedOver) {
+    for (const char* const profile : {"82", "0x8", "0x8g", "0x821"}) {
+        Values values = Good();
+        values.insert(
+            {{"rp210:BitRate", "1"}, {"rp210:MaxGOP", "1"}, {"rp210:ProfileAndLevel", profile}});
+        EXPECT_THAT(Check(Record(values, "10000", "MPEG2Video")),
+                    Contains(HasSubstr("rp210:ProfileAndLevel can't be \"" + std::string(profile) +
+                                       "\"; write 0x and two digits")));
+    }
+}
+
+TEST_F(DataChecks, FindNamesThatMeanNothingAndTellTheRightOne) {
+    EXPECT_THAT(Check(Record(With("WhiteRefLevel", "940"))),
+                Contains(HasSubstr("rp210:WhiteRefLevel means nothing here; write "
+                                   "rp210:WhiteReflevel, as the module spells it")));
+    EXPECT_THAT(Check(Record(Good()), Row("dvc ", "id='10000'")),
+                Contains(HasSubstr("id means nothing here; ")));
+    EXPECT_THAT(Check(Record(Good()) + "<MediaDescriptorSignatur/>"),
+                Contains(HasSubstr("MediaDescriptorSignatur means nothing here; write "
+                                   "MediaDescriptorSignature")));
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
+                             "<rp210:VideoLineMap><Line>1</Line><rp210:Element>1</rp210:Element>"
+                             "</rp210:VideoLineMap>")),
+                Contains(HasSubstr("Line means nothing here")));
+}
+
+TEST_F(DataChecks, FindBlanksAroundAValue) {
+    EXPECT_THAT(Check(Record(With("ColorSiting", "0 "))),
+                Contains(HasSubstr("rp210:ColorSiting is empty or has blanks around it")));
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
+                             "<rp210:VideoLineMap><rp210:Element>\n 23</rp210:Element>"
+                             "</rp210:VideoLineMap>")),
+                Contains(HasSubstr("rp210:Element is empty or has blanks around it")));
+    EXPECT_THAT(Check(Record(Good()),
+                      "<FourCharMapping FourChar='dvc '><vcid>10000</vcid><Vendor/>"
+                      "</FourCharMapping>"),
+                Contains(HasSubstr("Vendor is empty or has blanks around it")));
+}
+
+TEST_F(DataChecks, FindWhatStandsThereTwice) {
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
+                             "<rp210:FrameLayout>1</rp210:FrameLayout>"
+                             "<rp210:VideoLineMap><rp210:Element>1</rp210:Element>"
+                             "</rp210:VideoLineMap>")),
+                Contains(HasSubstr("rp210:FrameLayout stands here a second time")));
+    EXPECT_THAT(Check("<MediaDescriptorSignature><NivoInfo ResolutionID='1'/><NivoInfo "
+                      "ResolutionID='2'/><groups:CDCIDescriptor/><groups:RGBADescriptor/>"
+                      "</MediaDescriptorSignature>"),
+                AllOf(Contains(HasSubstr("NivoInfo stands here a second time")),
+                      Contains(HasSubstr("this is a second descriptor"))));
+}
+
+TEST_F(DataChecks, FindEntriesWithoutKeyOrDescriptor) {
+    EXPECT_THAT(Check("<MediaDescriptorSignature><NivoInfo/></MediaDescriptorSignature>"),
+                AllOf(Contains(HasSubstr("NivoInfo lacks ResolutionID")),
+                      Contains(HasSubstr("the record has no descriptor"))));
+    EXPECT_THAT(Check("<MediaDescriptorSignature/>"),
+                Contains(HasSubstr("MediaDescriptorSignature lacks NivoInfo")));
+    EXPECT_THAT(Check(Record(Good(), "010000")), Contains(HasSubstr("ResolutionID can't be")));
+    EXPECT_THAT(Check(Record(Good()), "<FourCharMapping vcid='1'/>"),
+                Contains(HasSubstr("FourCharMapping lacks FourChar")));
+    EXPECT_THAT(Check(Record(Good()), Row("dvc", "vcid='1'")),
+                Contains(HasSubstr("FourChar must have four characters, not \"dvc\"")));
+    EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10000' Vendor='applX'")),
+                Contains(HasSubstr("of Vendor only \"appl\" counts")));
+}
+
+TEST_F(DataChecks, FindAnIdOfOneRecordWhereTheSizeIsNotFixed) {
+    const std::string rows = Row("v210", "vcid='10000'");
+    EXPECT_THAT(Check(Record(Good()), rows),
+                ElementsAre(HasSubstr("AAFInfo.xml:2:1: id 10000 has one record, so a picture of "
+                                      "any height gets it; repeat the record")));
+    EXPECT_THAT(Check(Record(Good()) + Record(Good()), rows), IsEmpty()) << "a repeat will do";
+}
+
+TEST_F(DataChecks, FindARepeatThatServesNothing) {
+    EXPECT_THAT(Check(Record(Good()) + Record(Good()) + Record(Good())),
+                Contains(AllOf(HasSubstr("AAFInfo.xml:4:1: "), HasSubstr("it is a repeat"))));
+}
+
+TEST_F(DataChecks, FindRecordsBehindOthers) {
+    const auto inLineTwo = HasSubstr("finds the record of id 10000 in line 2 instead of this one");
+    // 486 lines pass for 480 by the rule of six lines more.
+    EXPECT_THAT(Check(Record(Sized("720", "480")) + Record(Sized("720", "486"))),
+                Contains(AllOf(HasSubstr("AAFInfo.xml:3:1: a picture of 720x486"), inLineTwo)));
+    EXPECT_THAT(Check(Record(Sized("720", "486")) + Record(Sized("720", "480"))), IsEmpty());
+    // Fields pass for frames and the reverse.
+    EXPECT_THAT(Check(Record(Sized("1920", "1080")) + Record(Sized("1920", "540"))),
+                Contains(AllOf(HasSubstr("1920x540"), inLineTwo)));
+    EXPECT_THAT(Check(Record(Sized("1920", "540")) + Record(Sized("1920", "1080"))),
+                Contains(AllOf(HasSubstr("1920x1080"), inLineTwo)));
+    EXPECT_THAT(Check(Record(Sized("1440", "540")) + Record(Sized("1920", "540"))), IsEmpty());
+}
+
+TEST_F(DataChecks, FindIdsThatNoCodeLeadsTo) {
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "10001")),
+                ElementsAre(HasSubstr("AAFInfo.xml:3:1: no code leads to id 10001; add a row")));
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "10950") + Record(Good(), "10950")),
+                IsEmpty())
+        << "movies name these themselves";
+}
+
+TEST_F(DataChecks, FindCodesThatLeadNowhere) {
+    EXPECT_THAT(
+        Check(Record(Good()),
+              Row("dvc ", "vcid='10000'") + Row("dvcp", "vcid='10001'") + Row("dvpp", "")),
+        ElementsAre(HasSubstr("FourCharMapper.xml:3:1: code \"dvcp\" leads to id 10001, which has "
+                              "no record; add a record with ResolutionID 10001"),
+                    HasSubstr("FourCharMapper.xml:4:1: code \"dvpp\" leads to no id; give it")));
+    EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10000'") + Row("apch", "")),
+                Contains(HasSubstr("code \"apch\" leads to no id; give the code a second row")));
+}
+
+TEST_F(DataChecks, FindRastersOfTheModulesTableWithoutARecord) {
+    EXPECT_THAT(
+        Check(Record(Good()), Row("dvc ", "vcid='10000'") + Row("apch", "") + Row("apch", "")),
+        Contains(HasSubstr("FourCharMapper.xml:4:1: code \"apch\" has no record for "
+                           "1920x1080 frames; add one with ResolutionID 3710 and "
+                           "FrameLayout 0")));
+}
+
+TEST_F(DataChecks, FindRowsThatNoMovieGetsItsIdBy) {
+    const std::string records = Record(Good()) + Record(Good());
+    EXPECT_THAT(Check(records, Row("v210", "Vendor='appl' vcid='10000'") +
+                                   Row("v210", "Vendor='appl' vcid='10000'")),
+                ElementsAre(AllOf(HasSubstr("FourCharMapper.xml:3:1: no movie gets id 10000"),
+                                  HasSubstr("has the same Vendor"))));
+    EXPECT_THAT(Check(records, Row("v210", "vcid='10000'") + Row("v210", "vcid='10000'")),
+                ElementsAre(AllOf(HasSubstr("FourCharMapper.xml:2:1: "),
+                                  HasSubstr("of rows without Vendor the last counts"))));
+    EXPECT_THAT(
+        Check(records, Row("dvc ", "vcid='10000'") + Row("apch", "vcid='10000'") + Row("apch", "")),
+        Contains(AllOf(HasSubstr("FourCharMapper.xml:3:1: no movie gets id 10000"),
+                       HasSubstr("the module's own table"))));
+    EXPECT_THAT(
+        Check(records, Row("v210", "Vendor='FFMP' vcid='10000'") +
+                           Row("v210", "Vendor='appl' vcid='10000'") + Row("v210", "vcid='10000'")),
+        IsEmpty());
+}
+
+// What is wrong in one file does not make all of the other wrong.
+TEST_F(DataChecks, TellNothingThatFollowsFromAnotherMistake) {
+    EXPECT_THAT(Check(Record(With("StoredWidth", "x"))),
+                ElementsAre(HasSubstr("rp210:StoredWidth can't be \"x\"")));
+    EXPECT_THAT(Check(Record(Good()), Row("dvc", "vcid='10000'")),
+                ElementsAre(HasSubstr("FourChar must have four characters")));
+}
+
+// A name that the module passes over leaves the rest of its row as it is.
+TEST_F(DataChecks, TellWhatIsWrongWithARowBesideAnUnknownName) {
+    EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10001' vendor='x'")),
+                AllOf(Contains(HasSubstr("vendor means nothing here")),
+                      Contains(HasSubstr("leads to id 10001, which has no record"))));
+}
+
+TEST_F(DataChecks, TellWhereAFileIsNotWellFormedAndCheckTheOther) {
+    const CheckedData checked =
+        CheckFiles("<Map>\n" + Row("dvc ", "vcid='0'") + "</Map>", "<Infos>\n  <a>\n</Infos>");
+    EXPECT_THAT(TextsOf(checked),
+                ElementsAre(HasSubstr("FourCharMapper.xml:2:34: vcid can't be \"0\""),
+                            HasSubstr("AAFInfo.xml:3:3: this is no well-formed XML: mismatched")));
+}
+
+TEST_F(DataChecks, TellFilesThatAreNotThere) {
+    const CheckedData checked = data_check::CheckData(folder_.path());
+    EXPECT_THAT(checked.findings, IsEmpty());
+    EXPECT_EQ(checked.unreadable[0], "there is no such file");
+    EXPECT_EQ(checked.unreadable[1], "there is no such file");
+}
+
+TEST_F(DataChecks, RefuseAFileThatIsTooLong) {
+    std::string large = "<Map>";
+    large.resize(9u << 20, ' ');
+    EXPECT_NE(CheckFiles(large + "</Map>", "<Infos/>").unreadable[0], "");
+}
+
+TEST_F(DataChecks, CountWhatTheyDoNotKeepOfAFileOfMistakes) {
+    std::string rows;
+    for (int i = 0; i < 50'000; ++i) {
+        rows += "<x/>";
+    }
+    const CheckedData checked = CheckFiles("<Map>" + rows + "</Map>", "<Infos/>");
+    EXPECT_EQ(checked.findings.size(), 1000u);
+    EXPECT_GE(checked.counts.findings, 50'000u);
+}
+
+TEST_F(DataChecks, TakeManyRowsOfOneCodeAndRecordsOfOneId) {
+    std::string rows;
+    for (int i = 0; i < 100'000; ++i) {
+        rows += "<FourCharMapping FourChar='dvc ' vcid='1'/>";
+    }
+    std::string records;
+    for (int i = 0; i < 3000; ++i) {
+        records += Record(Good());
+    }
+    EXPECT_GT(
+        CheckFiles("<Map>" + rows + "</Map>", "<Infos>" + records + "</Infos>").counts.findings,
+        100'000u);
+}
+
+}  // namespace
