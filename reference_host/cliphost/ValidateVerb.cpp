@@ -184,7 +184,7 @@ void PrintList(const std::vector<const Check*>& checks, bool asJson) {
 }
 
 // Who reads what is printed may go away.
-void FlushOutput() {
+void FlushAnswer() {
     if (std::fflush(stdout) != 0 && errno != EPIPE) {
         throw std::system_error(errno, std::generic_category(), "standard output");
     }
@@ -216,7 +216,7 @@ int Validate(ValidateOptions& options, const SessionOptions& session) {
             outcomes.push_back(ToJson(call, check, outcome));
         } else {
             fmt::print("{}", ToText(call, check, outcome));
-            FlushOutput();
+            FlushAnswer();
         }
     };
     if (!options.json) {
@@ -235,7 +235,7 @@ int Validate(ValidateOptions& options, const SessionOptions& session) {
     } else {
         fmt::print("{}\n", tally.Line());
     }
-    FlushOutput();
+    FlushAnswer();
     return tally.HasFault() ? kExitFile : kExitFine;
 }
 
