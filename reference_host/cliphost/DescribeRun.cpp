@@ -12,6 +12,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/Notice.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/Stringout.h"
 #include "reference_host/cliphost/Words.h"
@@ -39,34 +40,6 @@ std::string EntryText(const ordered_json& head, const std::string& description) 
         text += kEnd;
     }
     return text;
-}
-
-bool IsPlaceOf(const std::filesystem::path& output, const std::filesystem::path& file) {
-    std::error_code error;
-    const auto whole = [&](const std::filesystem::path& path) {
-        return std::filesystem::weakly_canonical(std::filesystem::absolute(path, error), error);
-    };
-    const std::filesystem::path place = whole(output);
-    return (!error && place == whole(file)) || std::filesystem::equivalent(output, file, error);
-}
-
-// What an output would take the place of, though the call needs both.
-struct CallFile {
-    const char* what;
-    std::filesystem::path file;
-};
-
-void RefuseOutputOnto(const std::filesystem::path& output, const std::vector<CallFile>& files) {
-    if (output.empty() || OutputFile::IsDevice(output)) {
-        return;
-    }
-    for (const CallFile& other : files) {
-        if (!other.file.empty() && !OutputFile::IsDevice(other.file) &&
-            IsPlaceOf(output, other.file)) {
-            throw Failure(kExitCaller, output, fmt::format("this is {}", other.what),
-                          "name another file");
-        }
-    }
 }
 
 }  // namespace

@@ -8,6 +8,7 @@
 #include <filesystem>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/Number.h"
@@ -121,6 +122,28 @@ void RefuseOutputOntoMovie(const std::filesystem::path& output,
     std::error_code ignored;
     if (output != "-" && std::filesystem::equivalent(output, movie, ignored)) {
         throw Failure(kExitCaller, output, "this is the movie itself", "name another file");
+    }
+}
+
+bool IsPlaceOf(const std::filesystem::path& output, const std::filesystem::path& file) {
+    std::error_code error;
+    const auto whole = [&](const std::filesystem::path& path) {
+        return std::filesystem::weakly_canonical(std::filesystem::absolute(path, error), error);
+    };
+    const std::filesystem::path place = whole(output);
+    return (!error && place == whole(file)) || std::filesystem::equivalent(output, file, error);
+}
+
+void RefuseOutputOnto(const std::filesystem::path& output, const std::vector<CallFile>& files) {
+    if (output.empty() || OutputFile::IsDevice(output)) {
+        return;
+    }
+    for (const CallFile& other : files) {
+        if (!other.file.empty() && !OutputFile::IsDevice(other.file) &&
+            IsPlaceOf(output, other.file)) {
+            throw Failure(kExitCaller, output, fmt::format("this is {}", other.what),
+                          "name another file");
+        }
     }
 }
 

@@ -3,6 +3,8 @@
 #pragma once
 
 #include <CLI/CLI.hpp>
+#include <filesystem>
+#include <vector>
 
 namespace cliphost {
 
@@ -33,5 +35,16 @@ std::string WithoutMarks(std::string text);
 // Refuses an output that would be written over the movie that it is made from.
 // Throws a Failure.
 void RefuseOutputOntoMovie(const std::filesystem::path& output, const std::filesystem::path& movie);
+
+// Whether an output would lie where the other file is or is going to be.
+bool IsPlaceOf(const std::filesystem::path& output, const std::filesystem::path& file);
+
+// What an output would take the place of, though the call needs both.
+struct CallFile {
+    const char* what;
+    std::filesystem::path file;  // empty: the call names none
+};
+// Throws a Failure.
+void RefuseOutputOnto(const std::filesystem::path& output, const std::vector<CallFile>& files);
 
 }  // namespace cliphost

@@ -130,11 +130,6 @@ void AddPoster(const Entry& entry, Json& facts) {
     }
 }
 
-void AddWarning(const Problem& problem, const char* kind, Json& facts) {
-    Json& warnings = facts["warnings"];
-    warnings.push_back(JsonOf(WarningRow(problem, kind, warnings.size()), kWarning));
-}
-
 // Does a part of the work; without it the clip is what it is, and says so.
 template <class Work>
 void TryPart(const Session& session, const char* kind, const std::filesystem::path& movie,
@@ -150,7 +145,7 @@ void TryPart(const Session& session, const char* kind, const std::filesystem::pa
     if (problem) {
         problem.reason = fmt::format("{}: {}", kind, problem.reason);
         TellProblem(problem, session.verbosity());
-        AddWarning(problem, kind, facts);
+        facts["warnings"].push_back(WarningOf(problem, kind));
     }
 }
 
@@ -167,20 +162,32 @@ void AddParameters(Session& session, const std::filesystem::path& movie,
     details["parameters"] = std::move(list);
 }
 
+// What was not read is not known to be silence.
+bool IsSilence(const Json& wave) {
+    return wave["isWhole"].get<bool>() && !wave["lacksSamples"].get<bool>() &&
+           wave["highest"].is_null();
+}
+
 void AddSounds(Essence& essence, Json& facts, Json& details) {
     Json waves = Json::array();
-    bool isSilent = true;
+    bool isSilent = essence.First(TrackKind::Sound) != nullptr;
     for (const ClipTrack& track : essence.tracks()) {
-        if (track.kind != TrackKind::Sound || waves.size() == kMostWaves) {
+        if (track.kind != TrackKind::Sound) {
             continue;
         }
+        if (waves.size() == kMostWaves) {
+            isSilent = false;
+            break;
+        }
+        bool isTrackSilent = false;
         TryPart(essence.session(), "sound", essence.movie(), facts, [&] {
             Json wave = ReadWave(essence, track);
-            isSilent = isSilent && wave["highest"].is_null() && !wave["lacksSamples"];
+            isTrackSilent = IsSilence(wave);
             waves.push_back(std::move(wave));
         });
+        isSilent = isSilent && isTrackSilent;
     }
-    if (!waves.empty() && isSilent) {
+    if (isSilent) {
         AddTrait(trait::kSilent, "all of its sound is silence", facts);
     }
     details["waves"] = std::move(waves);
@@ -213,6 +220,10 @@ void AddEssence(Session& session, const std::filesystem::path& movie, Json& fact
 }
 
 }  // namespace
+
+Json WarningOf(const Problem& problem, const char* kind) {
+    return JsonOf(WarningRow(problem, kind, 0), kWarning);
+}
 
 Json ClipOf(const Entry& entry) {
     const Row& movie = entry.at("movies").at(0);

@@ -2,11 +2,14 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/ReportOdd.h"
 
+#include <cmath>
 #include <map>
 #include <nlohmann/json.hpp>
+#include <set>
 #include <string>
 
 #include "reference_host/cliphost/ReportTraits.h"
+#include "reference_host/util/text/Number.h"
 
 namespace cliphost {
 namespace {
@@ -31,10 +34,23 @@ std::string ColorsOf(const Json& clip) {
            : clip.contains("colors") ? TextOf(clip, "colors")
                                      : "not told";
 }
+// Addresses are dropped of some 30 frames a second, or of several times as many. A rate is "30/1".
+bool CanDrop(const std::string& rate) {
+    const std::string_view text = rate;
+    const std::size_t slash = text.find('/');
+    double frames = 0;
+    double seconds = 0;
+    if (slash == std::string_view::npos || !host::text::ReadNumber(text.substr(0, slash), frames) ||
+        !host::text::ReadNumber(text.substr(slash + 1), seconds) || seconds <= 0) {
+        return false;
+    }
+    const double rounded = std::round(frames / seconds);
+    return rounded > 0 && std::fmod(rounded, 30) == 0;
+}
 std::string CountingOf(const Json& clip) {
-    return !clip.value("hasTimecode", false) ? std::string()
-           : clip.value("drop", false)       ? "drop-frame"
-                                             : "non-drop";
+    return !clip.value("hasTimecode", false) || !CanDrop(TextOf(clip, "rate")) ? std::string()
+           : clip.value("drop", false)                                         ? "drop-frame"
+                                                                               : "non-drop";
 }
 std::string ContentOf(const Json& clip) {
     return TextOf(clip, "id");
@@ -126,9 +142,22 @@ constexpr Finding kFindings[] = {
      "The module decodes it for the host, which takes longer than reading.", Odd::Any, nullptr},
 };
 
-bool IsOdd(const Finding& finding, Groups& groups) {
+// A movie that is named several times is no copy of itself.
+Json OncePerPath(const Json& clips, const Json& numbers) {
+    std::set<std::string> paths;
+    Json once = Json::array();
+    for (const Json& number : numbers) {
+        if (paths.insert(TextOf(clips[number.get<std::size_t>()], "path")).second) {
+            once.push_back(number);
+        }
+    }
+    return once;
+}
+
+bool IsOdd(const Json& clips, const Finding& finding, Groups& groups) {
     if (finding.odd == Odd::Copies) {
         for (auto group = groups.begin(); group != groups.end();) {
+            group->second = OncePerPath(clips, group->second);
             group = group->second.size() > 1 ? std::next(group) : groups.erase(group);
         }
     }
@@ -142,7 +171,7 @@ Json OddThings(const Json& clips) {
     for (const Finding& finding : kFindings) {
         Groups groups =
             finding.label ? GroupedBy(clips, finding.label) : GroupedByTrait(clips, finding.id);
-        if (!IsOdd(finding, groups)) {
+        if (!IsOdd(clips, finding, groups)) {
             continue;
         }
         Json list = Json::array();

@@ -12,6 +12,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
+#include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/ReportClip.h"
 #include "reference_host/cliphost/ReportOdd.h"
 #include "reference_host/cliphost/ReportPictures.h"
@@ -63,7 +64,7 @@ std::string Dumped(const Json& json) {
 
 std::string TitleOf(const ReportOptions& options) {
     if (!options.title.empty()) {
-        return options.title;
+        return host::DisplayPath(options.title);
     }
     const std::vector<std::filesystem::path>& paths = options.movies.paths;
     if (paths.size() != 1) {
@@ -92,10 +93,10 @@ void TakeCatalogs(ReportOptions& options) {
         options.title = options.title.empty() && options.movies.paths.size() == 1
                             ? host::DisplayPath(path.filename())
                             : options.title;
-        options.catalogs.push_back(OpenCatalog(path, catalog::Catalog::For::Reading));
+        options.catalogs.push_back({path, OpenCatalog(path, catalog::Catalog::For::Reading)});
         WithCatalog(path, [&] {
-            catalog::Statement select =
-                options.catalogs.back().database().Prepare("SELECT path FROM movies ORDER BY path");
+            catalog::Statement select = options.catalogs.back().catalog.database().Prepare(
+                "SELECT path FROM movies ORDER BY path");
             while (select.Step()) {
                 paths.push_back(PathOfMachinePath(select.Text(0)));
             }
@@ -129,6 +130,17 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
         report::Page::Form{TitleOf(options), options.isSplit});
 }
 
+// The page takes its place when all was read, so nothing that is read may lie there.
+void ReportRun::Planned(const MoviePlan&) {
+    const std::filesystem::path& page = options_.movies.together;
+    std::vector<CallFile> read = {{"the list of movies", options_.movies.list}};
+    for (const ReportOptions::NamedCatalog& one : options_.catalogs) {
+        read.push_back({"a catalog that the page is made from", one.file});
+    }
+    RefuseOutputOnto(page, read);
+    RefuseOntoMovie(page);
+}
+
 MovieAnswer ReportRun::Answer(const MovieStep& step, const PlaceOfFile&) {
     return ReportAnswer(session(), codecs_, options_.maps, step.movie);
 }
@@ -144,8 +156,8 @@ void ReportRun::Show(const std::filesystem::path& movie, const MovieAnswer& answ
 }
 
 std::optional<catalog::Entry> ReportRun::EntryInCatalogs(const std::filesystem::path& movie) {
-    for (catalog::Catalog& one : options_.catalogs) {
-        if (auto entry = one.Read(AbsoluteMachinePath(movie))) {
+    for (ReportOptions::NamedCatalog& one : options_.catalogs) {
+        if (auto entry = one.catalog.Read(AbsoluteMachinePath(movie))) {
             return entry;
         }
     }
@@ -162,11 +174,7 @@ void ReportRun::ShowFailure(const std::filesystem::path& movie, const Problem& p
         known ? ClipOf(*known) : Json{{"facts", Json::object()}, {"details", Json::object()}};
     Json& facts = clip["facts"];
     facts["route"] = problem.route.empty() ? route::kNone : problem.route;
-    Json warning = {{"kind", "failure"}, {"reason", problem.reason}};
-    if (!problem.hint.empty()) {
-        warning["hint"] = problem.hint;
-    }
-    Json warnings = Json::array({std::move(warning)});
+    Json warnings = Json::array({WarningOf(problem, "failure")});
     for (Json& before : facts["warnings"]) {
         warnings.push_back(std::move(before));
     }

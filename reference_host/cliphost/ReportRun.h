@@ -23,8 +23,12 @@ struct ReportOptions {
     std::string title;     // empty: what the command line names
     bool json = false;     // print what the page is made of in its place
     bool isSplit = false;  // pictures into a folder beside the page
+    struct NamedCatalog {
+        std::filesystem::path file;
+        catalog::Catalog catalog;
+    };
     // Those of the command line; what they know of movies that can't be read is told.
-    std::vector<catalog::Catalog> catalogs;
+    std::vector<NamedCatalog> catalogs;
 };
 
 // Takes the catalogs out of the paths and puts their movies there. Throws a Failure.
@@ -40,6 +44,7 @@ public:
 private:
     using Json = nlohmann::ordered_json;
 
+    void Planned(const MoviePlan& plan) override;
     MovieAnswer Answer(const MovieStep& step, const PlaceOfFile& place) override;
     bool ReadAnswer(const std::string& bytes, MovieAnswer& answer) override;
     void Show(const std::filesystem::path& movie, const MovieAnswer& answer,

@@ -179,6 +179,30 @@ TEST_F(Reports, TellSilence) {
     EXPECT_EQ(TraitsOf(ClipOf(MadeMovie("h264_with_aac.mov"))).count("silent"), 0u);
 }
 
+TEST_F(Reports, CallNoSoundSilenceThatWasNotLookedAt) {
+    const std::string silence = "-f lavfi -t 0.2 -i anullsrc=r=48000:cl=mono ";
+    const std::string sine = "-f lavfi -i sine=sample_rate=48000:duration=0.2 ";
+    std::string sixteen;
+    for (int track = 0; track < 16; ++track) {
+        sixteen += "-map 0 ";
+    }
+    const Json many = ClipOf(Make(silence + sine + sixteen + "-map 1 -c:a pcm_s16be", "many.mov"));
+    EXPECT_EQ(many["details"]["waves"].size(), 16u);
+    EXPECT_EQ(TraitsOf(many).count("silent"), 0u);
+
+    const auto made =
+        Make(silence + sine + "-map 0 -map 1 -c:a:0 pcm_s16be -c:a:1 adpcm_ima_qt", "two.mov");
+    std::string movie = TextOfFile(made);
+    const std::string code = "ima4";
+    for (std::size_t at = movie.find(code); at != std::string::npos; at = movie.find(code, at)) {
+        movie.replace(at, code.size(), "xyz1");
+    }
+    std::ofstream(made, std::ios::binary) << movie;
+    const Json unread = ClipOf(made);
+    EXPECT_EQ(unread["details"]["waves"].size(), 1u);
+    EXPECT_EQ(TraitsOf(unread).count("silent"), 0u);
+}
+
 TEST_F(Reports, TellWhyTheModuleServesMedia) {
     EXPECT_EQ(WordsOf(ClipOf(MadeMovie("pcm_u8.mov")), "provider"),
               "audio track 1: An audio bit rate of 8 was found but only bit rates of 16 and 24 are "
@@ -190,6 +214,7 @@ TEST_F(Reports, TellWhatIsOddTogether) {
     Copy("timecode_25.mov", "in/a.mov");
     Copy("timecode_25.mov", "in/b.mov");
     Copy("timecode_2997_drop.mov", "in/c.mov");
+    Copy("timecode_2997_nondrop.mov", "in/d.mov");
     std::set<std::string> ids;
     const Json report = Report("in");
     for (const Json& finding : report["odd"]) {
@@ -197,9 +222,22 @@ TEST_F(Reports, TellWhatIsOddTogether) {
         if (finding["id"] == "copies") {
             EXPECT_EQ(finding["groups"][0]["clips"].dump(), "[0,1]");
         }
+        if (finding["id"] == "drop") {
+            EXPECT_EQ(finding["groups"][0]["clips"].dump(), "[2]");
+            EXPECT_EQ(finding["groups"][1]["clips"].dump(), "[3]");
+        }
     }
     for (const char* const id : {"copies", "rates", "drop"}) {
         EXPECT_EQ(ids.count(id), 1u) << id;
+    }
+}
+
+TEST_F(Reports, CallNoMovieACopyOfItself) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    const Json report = Report("in in/a.mov");
+    EXPECT_EQ(report["clips"].size(), 2u);
+    for (const Json& finding : report["odd"]) {
+        EXPECT_NE(finding["id"], "copies");
     }
 }
 
@@ -212,6 +250,7 @@ TEST_F(Reports, HoldMoviesThatCanNotBeDescribedWithTheReason) {
     EXPECT_EQ(report["clips"][1]["failed"], true);
     EXPECT_EQ(report["clips"][1]["name"], "none");
     EXPECT_FALSE(report["clips"][1]["warnings"][0]["reason"].get<std::string>().empty());
+    EXPECT_EQ(report["clips"][1]["warnings"][0]["code"].get<std::string>().substr(0, 4), "NMA_");
     EXPECT_FALSE(report["clips"][2].contains("size"));
     EXPECT_EQ(report["odd"][0]["id"], "failed");
 }
@@ -267,6 +306,8 @@ TEST_F(Reports, MakeNoMarkupOfNames) {
     EXPECT_EQ(page.find("\xE2\x80\xA8"), std::string::npos);
     EXPECT_EQ(page.find('\xff'), std::string::npos);
     EXPECT_NE(page.find("\\u003cscript\\u003ealert(1)"), std::string::npos);
+    ExpectSays(Run("in -o r.html --title 'a\xff'"), 0, "r.html: 2 clips");
+    EXPECT_EQ(TextOfFile(folder() / "r.html").find('\xff'), std::string::npos);
     const Json clips = Report("in")["clips"];
     EXPECT_EQ(clips[0]["path"], (folder() / "in" / evil).string());
     EXPECT_EQ(clips[1]["path"].get<std::string>().substr(0, 7), "file://");
@@ -315,6 +356,33 @@ TEST_F(Reports, RefuseCallsThatCanNotBeMeant) {
     std::ofstream(folder() / "r_files") << "a file";
     ExpectSays(Run("a.mov -o r.html --split"), 2, "r_files");
     EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+}
+
+TEST_F(Reports, TakeThePlaceOfNoMovieThatIsRead) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    Copy("pcm_u8.mov", "in/b.mov");
+    for (const char* const call :
+         {"in/b.mov -o in/b.mov", "in -o in/b.mov", "in/a.mov in/b.mov -o in/b.mov --jobs 2"}) {
+        ExpectSays(Run(call), 2, "b.mov: this is the movie itself");
+        EXPECT_EQ(ReadFile(folder() / "in/b.mov"), ReadFile(MadeMovie("pcm_u8.mov"))) << call;
+    }
+    const std::set<std::string> both = {"a.mov", "b.mov"};
+    EXPECT_EQ(FilesIn("in"), both);
+}
+
+TEST_F(Reports, TakeThePlaceOfNoListOrCatalogThatIsRead) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    std::ofstream(folder() / "l.txt") << "in/a.mov\n";
+    ASSERT_EQ(RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
+                         " catalog in -o c.sqlite")
+                  .status,
+              0);
+    const std::string catalog = TextOfFile(folder() / "c.sqlite");
+    ExpectSays(Run("c.sqlite -o c.sqlite"), 2,
+               "c.sqlite: this is a catalog that the page is made from");
+    ExpectSays(Run("--files-from l.txt -o l.txt"), 2, "l.txt: this is the list of movies");
+    EXPECT_TRUE(TextOfFile(folder() / "c.sqlite") == catalog);
+    EXPECT_EQ(TextOfFile(folder() / "l.txt"), "in/a.mov\n");
 }
 
 TEST_F(Reports, TellWhichPartOfAMovieCanNotBeRead) {

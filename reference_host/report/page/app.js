@@ -9,6 +9,7 @@ const main = document.getElementById('main');
 const table = makeTable();
 let scrolled = 0;
 let lastClip = null;
+let keys = {};  // of the view that is shown: the addresses to which they lead
 
 function goTo(address) {
   location.hash = address;
@@ -44,20 +45,20 @@ function show() {
     else one.removeAttribute('aria-current');
   });
   if (clip || page === 'odd') {
-    const shownView = clip ? clipView(clip, table.order().includes(clip) ? table.order() : clips, goTo)
+    const shownView = clip ? clipView(clip, table.order().includes(clip) ? table.order() : clips)
                            : oddView(showOnly);
     lastClip = clip || lastClip;
+    keys = shownView.keys || {};
     main.replaceChildren(shownView.view);
     document.title = shown(shownView.title + ' \u2013 ' + report.title);
     scrollTo(0, 0);
     shownView.heading.focus({preventScroll: true});
     return;
   }
+  keys = {};
   main.replaceChildren(table.view);
   document.title = shown(report.title);
   table.show();
-// For whoever measures how long it takes until the page can be used.
-requestAnimationFrame(() => setTimeout(() => performance.mark('usable')));
   scrollTo(0, scrolled);
   if (lastClip) table.focusClip(lastClip);
   lastClip = null;
@@ -65,8 +66,9 @@ requestAnimationFrame(() => setTimeout(() => performance.mark('usable')));
 
 addEventListener('hashchange', show);
 addEventListener('keydown', (event) => {
-  if (event.key === '/' && !event.target.closest('input, select, textarea') && !event.ctrlKey &&
-      !event.altKey && !event.metaKey) {
+  if (event.target.closest('input, select, textarea') || event.ctrlKey || event.altKey || event.metaKey) return;
+  if (keys[event.key]) goTo(keys[event.key]);
+  if (event.key === '/') {
     event.preventDefault();
     if (!table.view.isConnected) {
       lastClip = null;

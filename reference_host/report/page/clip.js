@@ -68,7 +68,14 @@ function pictures(clip, details) {
   return el('div', {class: 'placeholder'}, el('p', {}, why ? 'No pictures. ' + why.reason : 'The movie has no pictures.'));
 }
 
-function clipView(clip, order, goTo) {
+function notDrawn(details) {
+  const sounds = details.tracks.filter((track) => track.kind === 'sound').length;
+  return sounds <= details.waves.length ? ''
+       : el('p', {class: 'fine'}, details.waves.length + ' of ' + sounds + ' sound tracks are drawn.');
+}
+
+// `keys`: where keys lead while the view is shown.
+function clipView(clip, order) {
   const details = {tracks: [], columns: [], parameters: [], waves: [], ...detailsOf(clip)};
   const at = order.indexOf(clip);
   const step = (by, label, key) => {
@@ -93,7 +100,7 @@ function clipView(clip, order, goTo) {
       : '',
     section('part-pictures', 'Pictures', pictures(clip, details)),
     details.waves.length ? section('part-sound', 'Sound', details.waves.map((wave) =>
-      waveform(wave, tracks.get(wave.track)))) : '',
+      waveform(wave, tracks.get(wave.track))), notDrawn(details)) : '',
     section('part-facts', 'Facts', summary(clip, details),
       details.tracks.length ? trackTable(details) : ''),
     details.columns.length ? section('part-columns', 'Bin columns', facts(details.columns.map((column) =>
@@ -103,11 +110,7 @@ function clipView(clip, order, goTo) {
       : '',
     details.samples ? section('part-samples', 'Samples in the file', sampleFacts(details.samples)) : '',
     details.description ? section('part-mobs', 'Mobs', mobChain(details.description)) : '');
-  view.addEventListener('keydown', (event) => {
-    if (event.altKey || event.ctrlKey || event.metaKey) return;
-    const to = {j: order[at + 1], k: order[at - 1]}[event.key];
-    if (to) goTo('#/clip/' + (to.number + 1));
-    if (event.key === 'Escape') goTo('#/');
-  });
-  return {view, heading, title: clip.name};
+  const address = (to) => to && '#/clip/' + (to.number + 1);
+  const keys = {j: address(order[at + 1]), k: address(order[at - 1]), Escape: '#/'};
+  return {view, heading, title: clip.name, keys};
 }

@@ -25,7 +25,7 @@ const CHIP_KINDS = [
 ];
 const MOST_CHIPS = 8;  // of a kind
 
-// `numbers`: clips of a group come together; those without one come last.
+// What clips of a group have in common; the groups come in the order of these texts.
 const GROUPINGS = [
   {id: 'none', title: 'Nothing'},
   {id: 'folder', title: 'Folder', of: (clip) => clip.folder},
@@ -33,20 +33,18 @@ const GROUPINGS = [
   {id: 'rate', title: 'Rate', of: (clip) => clip.rate ? rateText(clip.rate) + '\u00a0fps' : 'No rate'},
 ];
 
-const byNumber = (of) => (a, b) => {
+// Orders of clips, rising with a sign of 1 and falling with -1. Those without a value come last in both.
+const by = (of, compare) => (sign) => (a, b) => {
   const left = of(a);
   const right = of(b);
   if (left === undefined || right === undefined) return (left === undefined) - (right === undefined);
-  return left - right;
+  return sign * compare(left, right);
 };
+const byNumber = (of) => by(of, (left, right) => left - right);
 const words = new Intl.Collator('en', {numeric: true, sensitivity: 'base'});
-const byText = (of) => (a, b) => {
-  const left = of(a) || '';
-  const right = of(b) || '';
-  return left && right ? words.compare(left, right) : (left === '') - (right === '');
-};
+const byText = (of) => by((clip) => of(clip) || undefined, words.compare);
 
-// A column of the table; `css` names it where screens are too narrow for all.
+// A column of the table. Its cells have its id as their class, by which narrow screens leave it out.
 const COLUMNS = [
   {id: 'name', title: 'Name', order: byText((clip) => clip.name)},
   {id: 'length', title: 'Length', number: true, order: byNumber((clip) => clip.seconds),
@@ -86,9 +84,9 @@ function fits(clip, wanted) {
 function rowsToShow() {
   const wanted = folded(filters.words).split(/\s+/).filter(Boolean);
   const column = COLUMNS.find((one) => one.id === filters.sort);
-  const sign = filters.isFalling ? -1 : 1;
+  const order = column.order(filters.isFalling ? -1 : 1);
   const found = clips.filter((clip) => fits(clip, wanted));
-  found.sort((a, b) => sign * column.order(a, b) || words.compare(a.name, b.name) || a.number - b.number);
+  found.sort((a, b) => order(a, b) || words.compare(a.name, b.name) || a.number - b.number);
   const grouping = GROUPINGS.find((one) => one.id === filters.grouping);
   if (!grouping.of) return found;
   const groups = new Map();

@@ -6,7 +6,7 @@
 const MOST_NAMED = 12;  // of a group
 
 function groupLabel(finding, group) {
-  return finding.id === 'copies' ? counted(group.clips.length, 'copy').replace('copys', 'copies')
+  return finding.id === 'copies' ? counted(group.clips.length, 'copy', 'copies')
        : finding.id === 'rates' ? rateText(group.label) + '\u00a0fps'
        : group.label;
 }

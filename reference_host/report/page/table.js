@@ -180,6 +180,7 @@ function makeTable() {
   });
   const sortBy = el('select', {id: 'sort', onchange: () => sort(sortBy.value)},
                     COLUMNS.map((column) => el('option', {value: column.id}, column.title)));
+  const reverse = el('button', {type: 'button', class: 'sortby', onclick: () => sort(filters.sort)}, 'Reverse order');
   const groupBy = el('select', {id: 'group'},
                      GROUPINGS.map((one) => el('option', {value: one.id}, one.title)));
   groupBy.addEventListener('change', () => {
@@ -191,7 +192,7 @@ function makeTable() {
   const bar = el('div', {class: 'tools'},
     el('div', {class: 'fields'},
       el('label', {class: 'search'}, el('span', {}, 'Search'), search),
-      el('label', {class: 'sortby'}, el('span', {}, 'Sort by'), sortBy),
+      el('label', {class: 'sortby'}, el('span', {}, 'Sort by'), sortBy), reverse,
       el('label', {}, el('span', {}, 'Group by'), groupBy), reset),
     chips(change));
 

@@ -14,8 +14,8 @@ function shown(text) {
   });
 }
 
-function counted(count, thing) {
-  return count.toLocaleString('en') + '\u00a0' + thing + (count === 1 ? '' : 's');
+function counted(count, thing, things = thing + 's') {
+  return count.toLocaleString('en') + '\u00a0' + (count === 1 ? thing : things);
 }
 
 // At most so many digits behind the point, and no zeros at the end.

@@ -56,19 +56,35 @@ TEST(OddThingsOfClips, TellMixedColoursOfPicturesAlone) {
               "colors: a 0, not told 1");
 }
 
+Json Counting(const char* rate, bool drop, bool hasTimecode = true) {
+    return Clip({{"rate", rate}, {"hasTimecode", hasTimecode}, {"drop", drop}});
+}
+
 TEST(OddThingsOfClips, TellDropBesideNonDropOfThoseWithTimecode) {
-    EXPECT_EQ(Told({Clip({{"hasTimecode", true}, {"drop", true}}),
-                    Clip({{"hasTimecode", true}, {"drop", false}})}),
+    EXPECT_EQ(Told({Counting("30000/1001", true), Counting("30000/1001", false)}),
               "drop: drop-frame 0, non-drop 1");
-    EXPECT_EQ(Told({Clip({{"hasTimecode", true}, {"drop", true}}),
-                    Clip({{"hasTimecode", false}, {"drop", false}})}),
-              "");
+    EXPECT_EQ(Told({Counting("30000/1001", true), Counting("30000/1001", false, false)}), "");
+}
+
+TEST(OddThingsOfClips, TellDropBesideNonDropOfRatesThatCanDropAlone) {
+    for (const char* const rate :
+         {"24/1", "25/1", "24000/1001", "50/1", "1/2", "0/1", "30/0", "x"}) {
+        EXPECT_EQ(Told({Counting("30000/1001", true), Counting(rate, false)}).find("drop:"),
+                  std::string::npos)
+            << rate;
+    }
+    EXPECT_NE(Told({Counting("30000/1001", true), Counting("60000/1001", false)}).find("drop:"),
+              std::string::npos);
 }
 
 TEST(OddThingsOfClips, TellCopiesByTheirContent) {
-    EXPECT_EQ(Told({Clip({{"id", "x"}}), Clip({{"id", "y"}}), Clip({{"id", "x"}})}),
-              "copies: x 0 2");
-    EXPECT_EQ(Told({Clip({{"id", "x"}}), Clip({{"id", "y"}})}), "");
+    const auto clip = [](const char* id, const char* path) {
+        return Clip({{"id", id}, {"path", path}});
+    };
+    EXPECT_EQ(Told({clip("x", "/a"), clip("y", "/b"), clip("x", "/c")}), "copies: x 0 2");
+    EXPECT_EQ(Told({clip("x", "/a"), clip("y", "/b")}), "");
+    EXPECT_EQ(Told({clip("x", "/a"), clip("x", "/a")}), "");
+    EXPECT_EQ(Told({clip("x", "/a"), clip("x", "/a"), clip("x", "/c")}), "copies: x 0 2");
 }
 
 TEST(OddThingsOfClips, TellTraitsByTheirWordsAndEachClipOnce) {
