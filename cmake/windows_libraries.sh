@@ -2,7 +2,7 @@
 # Builds for 64-bit Windows what the program links, out of the sources of Debian's packages, and prints the
 # folder where it lies. A machine does that once: the folder's name tells the recipe, the compiler, and the
 # versions that Linux has. Of apt it has lists of its own, so the machine's stay as they are.
-set -euo pipefail
+set -Eeuo pipefail
 
 release=bookworm
 host=x86_64-w64-mingw32
@@ -18,8 +18,8 @@ known=(libavcodec-dev libdav1d6 libsqlite3-dev libwebp-dev libpng-dev libexpat1-
 # What movies hold, and the kinds of files that hold them. Probing of other kinds could find them in
 # what is damaged, so the kinds that Linux knows and this list lacks are refused here.
 demuxers=aac,ac3,aiff,amr,apng,asf,au,avi,caf,dirac,dnxhd,dts,dv,eac3,flac,flv,gif,gxf,h261,h263,h264,hevc
-demuxers+=,image2,'image_*_pipe',ivf,loas,m4v,matroska,mjpeg,mlp,mov,mp3,'mpeg*',mxf,obu,ogg,qcp,rm
-demuxers+=,tiertexseq,truehd,tty,vc1,voc,w64,wav,yuv4mpegpipe
+demuxers+=,image2,'image_*_pipe',ivf,loas,m4v,matroska,mjpeg,mlp,mov,mp3,'mpeg*',mxf,obu,ogg,qcp
+demuxers+=,truehd,tty,vc1,voc,w64,wav,yuv4mpegpipe
 decoders=aasc,aic,amv,apng,'asv*',avrn,avrp,avui,ayuv,bmp,cfhd,cinepak,cljr,cscd,cyuv,dirac,dnxhd,dpx,dvvideo
 decoders+=,dxv,eightbps,exr,ffv1,ffvhuff,flashsv,flv,fraps,gif,h261,'h263*',h264,hap,hevc,hq_hqa,hqx,huffyuv
 decoders+=,hymt,'indeo*',jpeg2000,jpegls,lagarith,magicyuv,'mjpeg*','mpeg*video',mpeg4,'msmpeg4*',msrle,msvideo1
@@ -49,7 +49,7 @@ build_dav1d() {
     "cpu = 'x86_64'" "endian = 'little'" >cross
   meson setup . "$1" --cross-file=cross --prefix="$prefix" --libdir=lib --default-library=static \
     --buildtype=release -Denable_tools=false -Denable_tests=false
-  DESTDIR=$root ninja install
+  DESTDIR=$root ninja -j"$(nproc)" install
 }
 
 build_sqlite3() {
@@ -94,7 +94,9 @@ build() { # build NAME: one library, into the stage
   local source
   source=$(printf '%s\n' "$work/source/$1"-[0-9]*/)
   install -D -m 644 "$source/debian/copyright" "$stage/licences/$1"
-  "build_${1//./_}" "${source%/}" >log 2>&1 || { tail -n 40 log >&2; return 255; }
+  # 255: xargs begins no other.
+  trap "tail -n 40 '$PWD/log' >&3; exit 255" ERR
+  "build_${1//./_}" "${source%/}" 3>&2 >log 2>&1
 }
 
 fetch() { # apt's own lists, keys and cache, and what they name
@@ -128,7 +130,7 @@ take_headers() { # what this machine has already: the compression library, and l
 }
 
 if [ "${1:-}" = --build ]; then # by this script alone, with its environment
-  for name in "${@:2}"; do build "$name" || exit; done
+  for name in "${@:2}"; do build "$name"; done
   exit
 fi
 
