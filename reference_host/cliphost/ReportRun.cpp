@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/ReportRun.h"
 
+#include <fmt/chrono.h>
 #include <fmt/format.h>
 
 #include <ctime>
@@ -20,7 +21,9 @@
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/report/PageText.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
+#include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
 namespace {
@@ -44,10 +47,7 @@ const DescriptionForm& FormOfClip() {
 
 // "2026-01-31T12:00:00Z"
 std::string TimeText(std::time_t seconds) {
-    char text[32];
-    std::tm parts{};
-    gmtime_r(&seconds, &parts);
-    return {text, std::strftime(text, sizeof text, "%Y-%m-%dT%H:%M:%SZ", &parts)};
+    return fmt::format("{:%Y-%m-%dT%H:%M:%SZ}", fmt::gmtime(seconds));
 }
 
 bool IsDatabase(const std::filesystem::path& file) {
@@ -64,7 +64,7 @@ std::string Dumped(const Json& json) {
 
 std::string TitleOf(const ReportOptions& options) {
     if (!options.title.empty()) {
-        return host::DisplayPath(options.title);
+        return host::text::Printable(options.title);
     }
     const std::vector<std::filesystem::path>& paths = options.movies.paths;
     if (paths.size() != 1) {
@@ -119,7 +119,8 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
     output_.emplace(file);
     if (options.isSplit) {
         folder_ = file;
-        folder_.replace_filename(file.stem().native() + kEndingOfFolder);
+        folder_.replace_filename(file.stem());
+        folder_ += kEndingOfFolder;
         madeFolder_.emplace(folder_);
     }
     page_.emplace(
@@ -188,7 +189,7 @@ void ReportRun::AddFile(const std::filesystem::path& movie, Json& facts) {
     facts["path"] = MachinePath(whole);
     facts["file"] = host::DisplayPath(whole.filename());
     facts["folder"] = host::DisplayPath(whole.parent_path());
-    std::string url = host::text::FileUrl(whole.native());
+    std::string url = host::system::UrlOfPath(whole);
     if (maps_.MapToOther(url)) {
         facts["place"] = url;
     }
@@ -228,8 +229,8 @@ void ReportRun::PutBeside(Json& owner, const char* name) {
     const std::string bytes = report::FromBase64(picture->value("data", std::string()));
     WriteWholeFile(file, {bytes.begin(), bytes.end()});
     picture->erase("data");
-    (*picture)["file"] =
-        host::text::PercentEncoded((folder_.filename() / file.filename()).native());
+    (*picture)["file"] = host::text::PercentEncoded(
+        host::system::GenericPathText(folder_.filename() / file.filename()));
 }
 
 // Those of an earlier page with more clips.
