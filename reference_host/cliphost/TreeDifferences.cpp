@@ -12,10 +12,13 @@
 #include "reference_host/cliphost/AafValue.h"
 #include "reference_host/cliphost/ListMatching.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/util/text/Cut.h"
 
 namespace cliphost {
 namespace {
 
+using host::text::IsInsideCharacter;
+using host::text::StartOf;
 using Kind = TreeDifference::Kind;
 
 // What says when, or by whom, an object was written.
@@ -175,18 +178,12 @@ std::string Brief(const TreeNode& node) {
     return count > 0 && count <= kFewFacts && node.branches.empty() ? text : node.title;
 }
 
-bool IsInsideCharacter(const std::string& text, std::size_t at) {
-    return at < text.size() && (static_cast<unsigned char>(text[at]) & 0xC0) == 0x80;
-}
-
 // A piece of a value from `start` on.
 std::string Piece(const std::string& value, std::size_t start) {
-    std::size_t end = std::min(value.size(), start + kLongestValue);
-    while (IsInsideCharacter(value, end)) {
-        --end;
-    }
-    return fmt::format("{}{}{}", start > 0 ? "..." : "", value.substr(start, end - start),
-                       end < value.size() ? "..." : "");
+    const std::string_view rest = std::string_view(value).substr(start);
+    const std::string_view piece = StartOf(rest, kLongestValue);
+    return fmt::format("{}{}{}", start > 0 ? "..." : "", piece,
+                       piece.size() < rest.size() ? "..." : "");
 }
 
 std::string Shown(const std::string& value) {

@@ -8,6 +8,8 @@
 #include <charconv>
 #include <numeric>
 
+#include "reference_host/util/text/Cut.h"
+
 namespace data_check {
 namespace {
 
@@ -26,10 +28,6 @@ bool HasOuterBlank(const std::string& text) {
     constexpr const char* kBlanks = " \t\r\n";
     return text.empty() || text.find_first_of(kBlanks) == 0 ||
            text.find_last_of(kBlanks) == text.size() - 1;
-}
-
-std::string Shown(const std::string& text) {
-    return text.size() <= kLongestShown ? text : text.substr(0, kLongestShown) + "...";
 }
 
 // How many letters have to be put in, taken out or changed.
@@ -70,6 +68,11 @@ void CheckName(const EntryReader& reader, const std::string& name, host::XmlPlac
 }
 
 }  // namespace
+
+std::string Shown(const std::string& text) {
+    const std::string start(host::text::StartOf(text, kLongestShown));
+    return start.size() == text.size() ? start : start + "...";
+}
 
 std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
     std::vector<Item> items;

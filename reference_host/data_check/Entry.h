@@ -50,6 +50,8 @@ private:
     Findings& findings_;
 };
 
+// A value for a text about it, in which it is cut where it is long.
+std::string Shown(const std::string& text);
 std::vector<Item> ItemsOf(const host::PlacedElement& parent, std::string_view name);
 // A whole number as the module compares it: no sign, no zeros before it.
 std::optional<std::uint32_t> NumberIn(const std::string& text);

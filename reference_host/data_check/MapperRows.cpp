@@ -4,6 +4,8 @@
 
 #include <fmt/format.h>
 
+#include "reference_host/util/text/Cut.h"
+
 namespace data_check {
 namespace {
 
@@ -23,7 +25,7 @@ std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryRe
     if (code && code->value.size() != kLengthOfCode) {
         reader.Tell(code->place,
                     fmt::format("FourChar must have four characters, not \"{}\"",
-                                code->value.substr(0, 4 * kLengthOfCode)),
+                                Shown(code->value)),
                     kHintForCode);
     }
     row.code = code ? code->value : "";
@@ -32,7 +34,8 @@ std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryRe
         if (vendor && vendor->value.size() > kLengthOfCode) {
             reader.Tell(
                 vendor->place,
-                fmt::format("of Vendor only \"{}\" counts", vendor->value.substr(0, kLengthOfCode)),
+                fmt::format("of Vendor only \"{}\" counts",
+                            host::text::StartOf(vendor->value, kLengthOfCode)),
                 "write the four characters that movies have");
         }
         row.vendor = vendor ? vendor->value.substr(0, kLengthOfCode) : "";

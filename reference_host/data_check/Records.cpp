@@ -210,8 +210,7 @@ private:
                              digits.find_first_not_of("0123456789abcdefABCDEF") == digits.npos;
         if (!isLabel) {
             reader_.Tell(item->place,
-                         fmt::format("{} is no universal label: \"{}\"", name,
-                                     item->value.substr(0, 2 * kLongest)),
+                         fmt::format("{} is no universal label: \"{}\"", name, Shown(item->value)),
                          kHint);
             return;
         }
@@ -295,7 +294,7 @@ private:
         if (item && (item->value.size() != 4 || item->value.compare(0, 2, "0x") != 0 ||
                      !isDigit(2) || !isDigit(3))) {
             reader_.Tell(item->place,
-                         fmt::format("{} can't be \"{}\"", kProfile, item->value.substr(0, 20)),
+                         fmt::format("{} can't be \"{}\"", kProfile, Shown(item->value)),
                          kHint);
         }
     }

@@ -332,6 +332,26 @@ TEST_F(DataChecks, FindRowsThatNoMovieGetsItsIdBy) {
         IsEmpty());
 }
 
+TEST_F(DataChecks, CutLongTextsBetweenCharacters) {
+    std::string longText = "x";
+    for (int i = 0; i < 100; ++i) {
+        longText += "\xC3\xA9";
+    }
+    const Texts texts =
+        Check(Record(With("ColorSiting", longText)) +
+                  Record(With("PictureEssenceCoding", longText), "10001"),
+              Row("dvc ", "vcid='10000' Vendor='" + longText + "'") + Row(longText, "vcid='1'"));
+    ASSERT_GE(texts.size(), 4u);
+    std::string start = "x";
+    for (int i = 0; i < 29; ++i) {
+        start += "\xC3\xA9";
+    }
+    EXPECT_THAT(texts, Contains(HasSubstr("ColorSiting can't be \"" + start + "...\"")));
+    EXPECT_THAT(texts, Contains(HasSubstr("label: \"" + start + "...\"")));
+    EXPECT_THAT(texts, Contains(HasSubstr("of Vendor only \"x\xC3\xA9\" counts")));
+    EXPECT_THAT(texts, Contains(HasSubstr("characters, not \"" + start + "...\"")));
+}
+
 // What is wrong in one file does not make all of the other wrong.
 TEST_F(DataChecks, TellNothingThatFollowsFromAnotherMistake) {
     EXPECT_THAT(Check(Record(With("StoredWidth", "x"))),
