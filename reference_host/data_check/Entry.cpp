@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <charconv>
 #include <numeric>
+#include <system_error>
 
 #include "reference_host/util/text/Cut.h"
 
@@ -19,7 +20,6 @@ using host::PlacedElement;
 // Its blanks count.
 constexpr std::string_view kCode = "FourChar";
 
-constexpr std::size_t kLongestNumber = 9;     // in digits; one of 32 bits takes it
 constexpr std::size_t kLongestShown = 60;     // of a value or name
 constexpr std::size_t kLongestCompared = 64;  // of names
 constexpr std::size_t kLikeness = 2;          // letters in which a mistyped name may differ
@@ -92,13 +92,13 @@ std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
 std::optional<std::uint32_t> NumberIn(const std::string& text) {
     std::uint32_t number = 0;
     const char* const end = text.data() + text.size();
-    const bool isPlain =
-        !text.empty() && text.size() <= kLongestNumber &&
-        std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; }) &&
-        (text.size() == 1 || text[0] != '0');
-    return isPlain && std::from_chars(text.data(), end, number).ptr == end
-               ? std::optional<std::uint32_t>(number)
-               : std::nullopt;
+    const auto [last, error] = std::from_chars(text.data(), end, number);
+    const bool isPlain = error == std::errc() && last == end && (text.size() == 1 || text[0] != '0');
+    return isPlain ? std::optional<std::uint32_t>(number) : std::nullopt;
+}
+
+bool IsId(std::uint32_t number) {
+    return number != 0 && number <= 0x7FFFFFFF;
 }
 
 std::optional<Item> EntryReader::One(const PlacedElement& parent, const char* name,

@@ -55,6 +55,8 @@ std::string Shown(const std::string& text);
 std::vector<Item> ItemsOf(const host::PlacedElement& parent, std::string_view name);
 // A whole number as the module compares it: no sign, no zeros before it.
 std::optional<std::uint32_t> NumberIn(const std::string& text);
+// Whether the module can find a record by this id: it writes ids as signed numbers.
+bool IsId(std::uint32_t number);
 // The entries of a name in a document, which may be one itself. What else stands beside them is
 // told.
 std::vector<const host::PlacedElement*> EntriesOf(const host::PlacedElement& root, const char* name,

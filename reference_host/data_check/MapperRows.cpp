@@ -11,8 +11,8 @@ namespace {
 
 constexpr std::size_t kLengthOfCode = 4;
 constexpr char kHintForCode[] = "write the four characters of the code; blanks count";
-constexpr NumberRule kVcid = {"vcid", [](std::uint32_t id) { return id != 0; },
-                              "a whole number above 0, or leave it out", false};
+constexpr NumberRule kVcid = {"vcid", IsId,
+                              "a whole number from 1 to 2147483647, or leave it out", false};
 
 std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryReader& reader,
                                  Findings& findings) {

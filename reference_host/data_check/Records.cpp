@@ -59,7 +59,7 @@ constexpr NumberRule kDepth = {"rp210:Depth", [](std::uint32_t n) { return n >= 
                                "1 to 64 bits", true};
 constexpr NumberRule kNumerator = {"types:Numerator", IsNotZero, kNotZero, true};
 constexpr NumberRule kDenominator = {"types:Denominator", IsNotZero, kNotZero, true};
-constexpr NumberRule kId = {"ResolutionID", IsNotZero, kNotZero, true};
+constexpr NumberRule kId = {"ResolutionID", IsId, "a whole number from 1 to 2147483647", true};
 
 constexpr char kSampleRate[] = "rp210:SampleRate";
 constexpr char kAspect[] = "rp210:AspectRatio";

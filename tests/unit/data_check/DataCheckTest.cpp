@@ -112,7 +112,7 @@ TEST_F(DataChecks, TellWhereAMistakeIsAndWhatHelps) {
         TextsOf(CheckFiles("<Map>\n  <FourCharMapping FourChar='dvc '\n      vcid='0'/>\n</Map>",
                            "<Infos>\n" + Record(Good()) + "</Infos>"));
     EXPECT_THAT(texts, ElementsAre("FourCharMapper.xml:3:7: vcid can't be \"0\"; give a whole "
-                                   "number above 0, or leave it out"));
+                                   "number from 1 to 2147483647, or leave it out"));
 }
 
 TEST_F(DataChecks, FindValuesThatAnAafLibraryRefuses) {
@@ -128,6 +128,8 @@ TEST_F(DataChecks, FindValuesThatAnAafLibraryRefuses) {
                                                           {"ComponentDepth", "17"},
                                                           {"ColorRange", "x"},
                                                           {"ColorRange", "4294967296"},
+                                                          {"ColorRange", "99999999999999999999"},
+                                                          {"ColorRange", "+897"},
                                                           {"ColorRange", "0897"},
                                                           {"BlackRefLevel", "-1"}}) {
         EXPECT_THAT(Check(Record(With(name, value))),
@@ -141,9 +143,20 @@ TEST_F(DataChecks, AcceptTheRestOfTheirRanges) {
                                                           {"ColorSiting", "255"},
                                                           {"HorizontalSubsampling", "4"},
                                                           {"VerticalSubsampling", "2"},
-                                                          {"FrameLayout", "4"}}) {
+                                                          {"FrameLayout", "4"},
+                                                          {"ImageStartOffset", "0"},
+                                                          {"ImageStartOffset", "4294967295"}}) {
         EXPECT_THAT(Check(Record(With(name, value))), IsEmpty()) << name << value;
     }
+}
+
+// The module writes ids as signed numbers when it compares them.
+TEST_F(DataChecks, FindIdsThatTheModuleCanNotFind) {
+    EXPECT_THAT(Check(Record(Good(), "2147483647"), Row("dvc ", "vcid='2147483647'")), IsEmpty());
+    EXPECT_THAT(Check(Record(Good(), "2147483648"), Row("dvc ", "vcid='2147483648'")),
+                ElementsAre(HasSubstr("vcid can't be \"2147483648\"; give a whole number from 1 to "
+                                      "2147483647"),
+                            HasSubstr("ResolutionID can't be \"2147483648\"")));
 }
 
 TEST_F(DataChecks, FindEveryValueThatARecordMustHave) {
