@@ -55,8 +55,11 @@ std::string HintFor(const std::string& name, const std::vector<const char*>& kno
     for (const char* const one : known) {
         all += (all.empty() ? "" : ", ") + std::string(one);
     }
-    return all.empty() ? "take it out: the value itself stands here"
-                       : fmt::format("take it out; the module reads: {}", all);
+    return fmt::format("take it out; the module reads: {}", all);
+}
+
+std::string HintFor(const NumberRule& rule) {
+    return fmt::format("give {}", rule.accepted);
 }
 
 void CheckName(const EntryReader& reader, const std::string& name, host::XmlPlace place,
@@ -83,7 +86,7 @@ std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
     }
     for (const PlacedElement& child : parent.elements) {
         if (child.name == name) {
-            items.push_back({child.text, child.place});
+            items.push_back({child.text, child.place, &child});
         }
     }
     return items;
@@ -113,7 +116,23 @@ std::optional<Item> EntryReader::One(const PlacedElement& parent, const char* na
              "take out all but one; the first counts");
         return std::nullopt;
     }
-    return std::move(items[0]);
+    return IsSound(items[0], name) ? std::optional<Item>(std::move(items[0])) : std::nullopt;
+}
+
+// The module takes what follows the name of a value for the value: an attribute, then the text.
+bool EntryReader::IsSound(const Item& item, const char* name) const {
+    if (item.element != nullptr && !item.element->attributes.empty()) {
+        const PlacedAttribute& first = item.element->attributes[0];
+        Tell(first.place, fmt::format("{} would get the value of {}", name, Shown(first.name)),
+             "take the attribute out: the value itself stands in the element");
+        return false;
+    }
+    if (name != kCode && HasOuterBlank(item.value)) {
+        Tell(item.place, fmt::format("{} is empty or has blanks around it", name),
+             "write the value with nothing around it; the module takes blanks for a part of it");
+        return false;
+    }
+    return true;
 }
 
 std::optional<std::uint32_t> EntryReader::Number(const PlacedElement& parent,
@@ -121,14 +140,20 @@ std::optional<std::uint32_t> EntryReader::Number(const PlacedElement& parent,
     if (!rule.isMandatory && ItemsOf(parent, rule.name).empty()) {
         return std::nullopt;
     }
-    const std::string hint = fmt::format("give {}", rule.accepted);
-    const std::optional<Item> item = One(parent, rule.name, hint);
-    if (!item) {
-        return std::nullopt;
-    }
-    const std::optional<std::uint32_t> number = NumberIn(item->value);
+    const std::optional<Item> item = One(parent, rule.name, HintFor(rule));
+    return item ? CheckedNumber(*item, rule) : std::nullopt;
+}
+
+std::optional<std::uint32_t> EntryReader::NumberOf(const Item& item, const NumberRule& rule) const {
+    return IsSound(item, rule.name) ? CheckedNumber(item, rule) : std::nullopt;
+}
+
+std::optional<std::uint32_t> EntryReader::CheckedNumber(const Item& item,
+                                                        const NumberRule& rule) const {
+    const std::optional<std::uint32_t> number = NumberIn(item.value);
     if (!number || !rule.accepts(*number)) {
-        Tell(item->place, fmt::format("{} can't be \"{}\"", rule.name, Shown(item->value)), hint);
+        Tell(item.place, fmt::format("{} can't be \"{}\"", rule.name, Shown(item.value)),
+             HintFor(rule));
         return std::nullopt;
     }
     return number;
@@ -158,26 +183,6 @@ void EntryReader::CheckNames(const PlacedElement& parent,
     }
     for (const PlacedElement& child : parent.elements) {
         CheckName(*this, child.name, child.place, known);
-    }
-}
-
-void EntryReader::CheckBlanks(const PlacedElement& element) const {
-    const auto check = [&](const std::string& name, const std::string& value,
-                           host::XmlPlace place) {
-        if (name != kCode && HasOuterBlank(value)) {
-            Tell(
-                place, fmt::format("{} is empty or has blanks around it", name),
-                "write the value with nothing around it; the module takes blanks for a part of it");
-        }
-    };
-    for (const PlacedAttribute& attribute : element.attributes) {
-        check(attribute.name, attribute.value, attribute.place);
-    }
-    if (element.attributes.empty() && element.elements.empty()) {
-        check(element.name, element.text, element.place);
-    }
-    for (const PlacedElement& child : element.elements) {
-        CheckBlanks(child);
     }
 }
 

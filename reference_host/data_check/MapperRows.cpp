@@ -18,7 +18,6 @@ std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryRe
                                  Findings& findings) {
     reader.CheckNames(entry, {"FourChar", "Vendor", "vcid"});  // the module passes over others
     const std::size_t before = findings.count();
-    reader.CheckBlanks(entry);
     MapperRow row;
     row.place = entry.place;
     const std::optional<Item> code = reader.One(entry, "FourChar", kHintForCode);

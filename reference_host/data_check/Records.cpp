@@ -64,7 +64,7 @@ constexpr NumberRule kId = {"ResolutionID", IsId, "a whole number from 1 to 2147
 constexpr char kSampleRate[] = "rp210:SampleRate";
 constexpr char kAspect[] = "rp210:AspectRatio";
 constexpr char kLineMap[] = "rp210:VideoLineMap";
-constexpr char kLine[] = "rp210:Element";
+constexpr NumberRule kLine = {"rp210:Element", IsAny, kAny, true};
 constexpr char kPixelLayout[] = "rp210:PixelLayout";
 constexpr char kComponent[] = "rp210:RGBALayout";
 constexpr char kProfile[] = "rp210:ProfileAndLevel";
@@ -97,7 +97,6 @@ private:
     // Nothing where it can't be told what finds it.
     std::optional<Record> Read(const PlacedElement& entry) {
         reader_.CheckNames(entry, {"NivoInfo", kCdciKind, kMpeg2Kind, kRgbaKind});
-        reader_.CheckBlanks(entry);
         const std::optional<std::uint32_t> id = ReadId(entry);
         const PlacedElement* const descriptor = DescriptorOf(entry);
         if (descriptor == nullptr) {
@@ -244,11 +243,12 @@ private:
         if (map == nullptr) {
             return;
         }
-        reader_.CheckNames(*map, {kLine});
-        const std::vector<Item> lines = ItemsOf(*map, kLine);
-        const auto isNumber = [](const Item& line) { return NumberIn(line.value).has_value(); };
-        if (lines.empty() || lines.size() > 2 ||
-            !std::all_of(lines.begin(), lines.end(), isNumber)) {
+        reader_.CheckNames(*map, {kLine.name});
+        const std::vector<Item> lines = ItemsOf(*map, kLine.name);
+        for (const Item& line : lines) {
+            static_cast<void>(reader_.NumberOf(line, kLine));
+        }
+        if (lines.empty() || lines.size() > 2) {
             reader_.Tell(map->place, fmt::format("{} must have one or two line numbers", kLineMap),
                          kHint);
         }

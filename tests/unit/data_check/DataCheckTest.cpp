@@ -233,15 +233,36 @@ TEST_F(DataChecks, FindNamesThatMeanNothingAndTellTheRightOne) {
 
 TEST_F(DataChecks, FindBlanksAroundAValue) {
     EXPECT_THAT(Check(Record(With("ColorSiting", "0 "))),
-                Contains(HasSubstr("rp210:ColorSiting is empty or has blanks around it")));
+                ElementsAre(HasSubstr("rp210:ColorSiting is empty or has blanks around it")));
+    EXPECT_THAT(Check(Record(With("PictureEssenceCoding", ""))),
+                ElementsAre(HasSubstr("PictureEssenceCoding is empty or has blanks around it")));
+    EXPECT_THAT(Check(Record(With("StoredWidth", " 720"))),
+                ElementsAre(HasSubstr("rp210:StoredWidth is empty or has blanks around it")));
     EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
                              "<rp210:VideoLineMap><rp210:Element>\n 23</rp210:Element>"
                              "</rp210:VideoLineMap>")),
-                Contains(HasSubstr("rp210:Element is empty or has blanks around it")));
+                ElementsAre(HasSubstr("rp210:Element is empty or has blanks around it")));
     EXPECT_THAT(Check(Record(Good()),
                       "<FourCharMapping FourChar='dvc '><vcid>10000</vcid><Vendor/>"
                       "</FourCharMapping>"),
-                Contains(HasSubstr("Vendor is empty or has blanks around it")));
+                ElementsAre(HasSubstr("Vendor is empty or has blanks around it")));
+}
+
+TEST_F(DataChecks, FindLinesThatAreNoNumbersByTheirPlaces) {
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
+                             "<rp210:VideoLineMap>\n<rp210:Element>x</rp210:Element>"
+                             "</rp210:VideoLineMap>")),
+                ElementsAre(HasSubstr("AAFInfo.xml:3:1: rp210:Element can't be \"x\"; give a whole "
+                                      "number")));
+}
+
+// Of an element with an attribute, the module takes that for the value.
+TEST_F(DataChecks, FindAttributesOfValues) {
+    EXPECT_THAT(Check(Record(Good()),
+                      "<FourCharMapping FourChar='dvc '><vcid note='x'>10000</vcid>"
+                      "</FourCharMapping>"),
+                ElementsAre(HasSubstr("FourCharMapper.xml:2:40: vcid would get the value of note; "
+                                      "take the attribute out")));
 }
 
 TEST_F(DataChecks, FindWhatStandsThereTwice) {
