@@ -432,6 +432,22 @@ TEST_F(DataChecks, CountWhatTheyDoNotKeepOfAFileOfMistakes) {
     EXPECT_GE(checked.counts.findings, 50'000u);
 }
 
+// What is found last, in both files together, may stand first.
+TEST_F(DataChecks, KeepTheFindingsThatStandFirst) {
+    std::string rows = Row("dvcp", "vcid='10001'");
+    for (int i = 0; i < 5000; ++i) {
+        rows += Row("dvc ", "vcid='x'");
+    }
+    const CheckedData checked =
+        CheckFiles("<Map>\n" + rows + "</Map>", "<Infos>\n" + Record(Good()) + "</Infos>");
+    ASSERT_EQ(checked.findings.size(), 1000u);
+    EXPECT_THAT(checked.findings.front().what, HasSubstr("leads to id 10001, which has no record"));
+    for (std::size_t i = 1; i < checked.findings.size(); ++i) {
+        EXPECT_EQ(checked.findings[i].place.line, i + 2);
+    }
+    EXPECT_GE(checked.counts.findings, 5001u);
+}
+
 TEST_F(DataChecks, TakeManyRowsOfOneCodeAndRecordsOfOneId) {
     std::string rows;
     for (int i = 0; i < 100'000; ++i) {
