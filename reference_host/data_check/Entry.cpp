@@ -70,6 +70,29 @@ void CheckName(const EntryReader& reader, const std::string& name, host::XmlPlac
     }
 }
 
+// Finds entries as the module does: wherever they stand, whatever is around them.
+struct EntrySearch {
+    std::string_view name;
+    std::vector<const PlacedElement*> entries = {};
+    std::vector<const PlacedElement*> strangers = {};  // the outermost elements without an entry
+
+    void Enter(const PlacedElement& element) {
+        if (element.name == name) {
+            entries.push_back(&element);
+            return;
+        }
+        const std::size_t entriesBefore = entries.size();
+        const std::size_t strangersBefore = strangers.size();
+        for (const PlacedElement& child : element.elements) {
+            Enter(child);
+        }
+        if (entries.size() == entriesBefore) {
+            strangers.resize(strangersBefore);
+            strangers.push_back(&element);
+        }
+    }
+};
+
 }  // namespace
 
 std::string Shown(const std::string& text) {
@@ -188,21 +211,20 @@ void EntryReader::CheckNames(const PlacedElement& parent,
 
 std::vector<const PlacedElement*> EntriesOf(const PlacedElement& root, const char* name,
                                             const EntryReader& reader) {
-    std::vector<const PlacedElement*> entries;
     if (root.name == name) {
         return {&root};
     }
+    EntrySearch search{name};
     for (const PlacedElement& child : root.elements) {
-        if (child.name == name) {
-            entries.push_back(&child);
-        } else {
-            CheckName(reader, child.name, child.place, {name});
-        }
+        search.Enter(child);
     }
-    if (entries.empty()) {
+    for (const PlacedElement* const stranger : search.strangers) {
+        CheckName(reader, stranger->name, stranger->place, {name});
+    }
+    if (search.entries.empty()) {
         reader.Tell(root.place, fmt::format("there is no {} in it", name), "add one");
     }
-    return entries;
+    return std::move(search.entries);
 }
 
 }  // namespace data_check

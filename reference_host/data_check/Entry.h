@@ -63,8 +63,8 @@ std::vector<Item> ItemsOf(const host::PlacedElement& parent, std::string_view na
 std::optional<std::uint32_t> NumberIn(const std::string& text);
 // Whether the module can find a record by this id: it writes ids as signed numbers.
 bool IsId(std::uint32_t number);
-// The entries of a name in a document, which may be one itself. What else stands beside them is
-// told.
+// The entries of a name in a document, which may be one itself; like the module, in other elements
+// too. What else stands beside them is told.
 std::vector<const host::PlacedElement*> EntriesOf(const host::PlacedElement& root, const char* name,
                                                   const EntryReader& reader);
 

@@ -231,6 +231,15 @@ TEST_F(DataChecks, FindNamesThatMeanNothingAndTellTheRightOne) {
                 Contains(HasSubstr("Line means nothing here")));
 }
 
+// The module passes over an element that it does not know, and reads what is in it.
+TEST_F(DataChecks, TakeEntriesOutOfElementsAroundThem) {
+    EXPECT_THAT(Check("<Group><More>" + Record(Good()) + "</More></Group>",
+                      "<DV>" + Row("dvc ", "vcid='10000'") + "</DV>"),
+                IsEmpty());
+    EXPECT_THAT(Check("<Group>\n<x><y/></x>" + Record(Good()) + "</Group>"),
+                ElementsAre(HasSubstr("AAFInfo.xml:3:1: x means nothing here")));
+}
+
 TEST_F(DataChecks, FindBlanksAroundAValue) {
     EXPECT_THAT(Check(Record(With("ColorSiting", "0 "))),
                 ElementsAre(HasSubstr("rp210:ColorSiting is empty or has blanks around it")));
