@@ -119,7 +119,8 @@ std::optional<std::uint32_t> NumberIn(const std::string& text) {
     std::uint32_t number = 0;
     const char* const end = text.data() + text.size();
     const auto [last, error] = std::from_chars(text.data(), end, number);
-    const bool isPlain = error == std::errc() && last == end && (text.size() == 1 || text[0] != '0');
+    const bool isPlain =
+        error == std::errc() && last == end && (text.size() == 1 || text[0] != '0');
     return isPlain ? std::optional<std::uint32_t>(number) : std::nullopt;
 }
 

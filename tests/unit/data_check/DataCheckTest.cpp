@@ -194,6 +194,104 @@ TEST_F(DataChecks, FindLayoutsWithTooManyComponentsAndLongCodes) {
                       Contains(HasSubstr("rp210:Depth can't be \"65\""))));
 }
 
+TEST_F(DataChecks, FindLevelsThatTheDepthHasNoRoomFor) {
+    EXPECT_THAT(Check(Record(With("WhiteReflevel", "1024"))),
+                ElementsAre(HasSubstr("rp210:WhiteReflevel can't be 1024: components have 10 bits; "
+                                      "give 1023 at most")));
+    EXPECT_THAT(Check(Record(With("ColorRange", "1024"))),
+                ElementsAre(HasSubstr("rp210:ColorRange can't be 1024: ")));
+    EXPECT_THAT(Check(Record(With("WhiteReflevel", "1023"))), IsEmpty());
+    EXPECT_THAT(Check(Record(With("ComponentDepth", "x"))),
+                ElementsAre(HasSubstr("rp210:ComponentDepth can't be \"x\"")));
+}
+
+TEST_F(DataChecks, FindABlackLevelThatIsNotBelowWhite) {
+    for (const char* const black : {"940", "1000"}) {
+        EXPECT_THAT(Check(Record(With("BlackRefLevel", black))),
+                    ElementsAre(HasSubstr("rp210:BlackRefLevel can't be " + std::string(black) +
+                                          ": rp210:WhiteReflevel is 940; give 939 at most")));
+    }
+    EXPECT_THAT(Check(Record(With("BlackRefLevel", "939"))), IsEmpty());
+}
+
+TEST_F(DataChecks, FindSizesLargerThanWhatIsStored) {
+    EXPECT_THAT(Check(Record(With("SampledWidth", "721"))),
+                ElementsAre(HasSubstr("rp210:SampledWidth can't be 721: rp210:StoredWidth is 720; "
+                                      "give 720 at most, or correct the other value")));
+    EXPECT_THAT(Check(Record(With("DisplayWidth", "1440"))),
+                ElementsAre(HasSubstr("rp210:DisplayWidth can't be 1440: ")));
+    EXPECT_THAT(Check(Record(With("DisplayHeight", "481"))),
+                ElementsAre(HasSubstr("rp210:DisplayHeight can't be 481: rp210:StoredHeight is")));
+    EXPECT_THAT(
+        Check(Record(With("DisplayYOffset", "1"))),
+        ElementsAre(HasSubstr("rp210:DisplayYOffset can't be 1: 480 of 480 lines are shown; "
+                              "give 0 at most")));
+    Values values = With("DisplayHeight", "470");
+    values["rp210:DisplayYOffset"] = "10";
+    EXPECT_THAT(Check(Record(values)), IsEmpty());
+    values["rp210:DisplayYOffset"] = "4294967295";
+    EXPECT_THAT(Check(Record(values)), ElementsAre(HasSubstr("give 10 at most")));
+}
+
+TEST_F(DataChecks, FindFieldsWithoutALineForEach) {
+    EXPECT_THAT(Check(Record(With("FrameLayout", "1"))),
+                ElementsAre(HasSubstr("rp210:VideoLineMap has no line for the second field")));
+}
+
+// None of the shipped records is of this kind.
+class RgbaRecords : public DataChecks {
+protected:
+    static std::string Component(const std::string& code, const std::string& depth = "8") {
+        return "<rp210:RGBALayout rp210:Code='" + code + "' rp210:Depth='" + depth + "'/>";
+    }
+    Texts CheckRgba(const std::string& components, const std::string& black = "16",
+                    const std::string& white = "235") {
+        Values values = Good();
+        for (const char* const name :
+             {"rp210:ComponentDepth", "rp210:HorizontalSubsampling", "rp210:VerticalSubsampling",
+              "rp210:ColorSiting", "rp210:ColorRange", "rp210:BlackRefLevel",
+              "rp210:WhiteReflevel"}) {
+            values.erase(name);
+        }
+        values["rp210:ComponentMinRef"] = black;
+        values["rp210:ComponentMaxRef"] = white;
+        return Check(Record(values, "10000", "RGBA",
+                            "<rp210:VideoLineMap><rp210:Element>23</rp210:Element>"
+                            "</rp210:VideoLineMap><rp210:PixelLayout>" +
+                                components + "</rp210:PixelLayout>"));
+    }
+    const std::string rgb_ = Component("R") + Component("G") + Component("B");
+};
+
+TEST_F(RgbaRecords, AreFineWithThreeColoursOrAPalette) {
+    EXPECT_THAT(CheckRgba(rgb_), IsEmpty());
+    EXPECT_THAT(CheckRgba(rgb_ + Component("F") + Component("A") + Component("F")), IsEmpty());
+    EXPECT_THAT(CheckRgba(Component("P")), IsEmpty());
+    EXPECT_THAT(CheckRgba(rgb_, "0", "255"), IsEmpty());
+}
+
+TEST_F(RgbaRecords, AreToldForLevelsThatTheirComponentsHaveNoRoomFor) {
+    EXPECT_THAT(
+        CheckRgba(rgb_, "16", "256"),
+        ElementsAre(HasSubstr("rp210:ComponentMaxRef can't be 256: components have 8 bits")));
+    EXPECT_THAT(CheckRgba(rgb_ + Component("A", "10"), "16", "256"), IsEmpty());
+    EXPECT_THAT(
+        CheckRgba(rgb_, "235", "235"),
+        ElementsAre(HasSubstr("rp210:ComponentMinRef can't be 235: rp210:ComponentMaxRef")));
+}
+
+TEST_F(RgbaRecords, AreToldForComponentsThatMakeNoPicture) {
+    EXPECT_THAT(CheckRgba(rgb_ + Component("X")),
+                ElementsAre(HasSubstr("rp210:Code can't be \"X\"; give R, G, B, A (alpha)")));
+    EXPECT_THAT(CheckRgba(rgb_ + Component("G")),
+                ElementsAre(HasSubstr("G stands here a second time")));
+    EXPECT_THAT(CheckRgba(Component("R") + Component("B")),
+                ElementsAre(HasSubstr("rp210:PixelLayout has no G")));
+    EXPECT_THAT(CheckRgba(rgb_ + Component("")),
+                ElementsAre(HasSubstr("rp210:Code is empty or has blanks around it")));
+    EXPECT_THAT(CheckRgba(""), Contains(HasSubstr("rp210:PixelLayout has 0 components")));
+}
+
 TEST_F(DataChecks, FindLabelsThatComeOutWrong) {
     for (const char* const label :
          {"{edb35383-6d30-11d3-a036-006094eb75cb}", "060e2b34-0401010d-04010202-030604",

@@ -107,8 +107,9 @@ TEST_F(HostChecks, FindTheRecordsThatTheModuleFinds) {
 
 TEST_F(HostChecks, FindRowsWhereTheModuleFindsThem) {
     const std::string path =
-        Write("map.xml", "<Map><DV><More><FourCharMapping FourChar='dvc ' vcid='7'/></More></DV>"
-                         "<Other/><FourCharMapping FourChar='dvcp' vcid='8'/></Map>");
+        Write("map.xml",
+              "<Map><DV><More><FourCharMapping FourChar='dvc ' vcid='7'/></More></DV>"
+              "<Other/><FourCharMapping FourChar='dvcp' vcid='8'/></Map>");
     const FourCharDataContainerReader module(host.factory(), NMAString(path.c_str()));
     data_check::Findings findings;
     const data_check::MapperRows read = data_check::ReadMapperRows(Load(path), findings);
@@ -123,9 +124,9 @@ TEST_F(HostChecks, FindRowsWhereTheModuleFindsThem) {
 
 // A value that an attribute of its element replaces is told, and no id is read there.
 TEST_F(HostChecks, TellAttributesThatTheModuleTakesForValues) {
-    const std::string path =
-        Write("map.xml", "<Map><FourCharMapping FourChar='dvc '><vcid note='8'>7</vcid>"
-                         "</FourCharMapping></Map>");
+    const std::string path = Write("map.xml",
+                                   "<Map><FourCharMapping FourChar='dvc '><vcid note='8'>7</vcid>"
+                                   "</FourCharMapping></Map>");
     const FourCharDataContainerReader module(host.factory(), NMAString(path.c_str()));
     ncfUInt32 id = 0;
     EXPECT_EQ(module.GetVCIDByFourChar(WordOf("dvc "), &id), NCF_OK);
