@@ -156,6 +156,26 @@ private:
         }
     }
 
+    static const char* HintForShadow(const Record& before, const Record& record) {
+        if (before.values == record.values) {
+            return "take this one out, it is a repeat";
+        }
+        if (HasSamePicture(before, record)) {
+            return "make the two alike, or take the wrong one out: they differ, and the first "
+                   "counts";
+        }
+        return FindsFirst(record, before)
+                   ? "give one of the two another id: each takes the other's pictures, in any order"
+                   : "put this one before it: larger heights come first";
+    }
+
+    // Whether a picture of the second one would find the first one before it.
+    static bool FindsFirst(const Record& first, const Record& second) {
+        const RecordsOfId both = {&first, &second};
+        return FindRecord(both, second.storedWidth, second.displayHeight) == 0u ||
+               FindRecord(both, second.sampledWidth, second.displayHeight) == 0u;
+    }
+
     // A record is to be found by a picture of its own size, by either width.
     void CheckShadow(const RecordsOfId& records, std::size_t at) {
         const Record& record = *records[at];
@@ -163,16 +183,14 @@ private:
             const std::optional<std::size_t> found =
                 FindRecord(records, width, record.displayHeight);
             // A repeat of the only record makes heights count.
-            const bool isRepeat = records.size() == 2 && HasSamePicture(*records[0], record);
+            const bool isRepeat = records.size() == 2 && records[0]->values == record.values;
             if (found && *found != at && !isRepeat) {
                 TellRecord(record,
                            fmt::format("a picture of {}x{} finds the record of id {} in line {} "
                                        "instead of this one",
                                        width, record.displayHeight, record.id,
                                        records[*found]->place.line),
-                           HasSamePicture(*records[*found], record)
-                               ? "take this one out, it is a repeat"
-                               : "put this one before it: larger heights come first");
+                           HintForShadow(*records[*found], record));
                 return;
             }
         }

@@ -90,6 +90,28 @@ constexpr std::string_view kOnce = "RGBAP";
 constexpr std::string_view kColours = "RGB";
 constexpr char kPalette = 'P';
 
+// What an element says: equal for elements that say the same in another order or form. Elements of
+// one name keep their order, as the lines of fields do.
+std::string ValuesOf(const PlacedElement& element) {
+    std::vector<std::pair<std::string_view, std::string>> items;
+    for (const host::PlacedAttribute& attribute : element.attributes) {
+        items.emplace_back(attribute.name, '=' + attribute.value);
+    }
+    for (const PlacedElement& child : element.elements) {
+        items.emplace_back(child.name, child.attributes.empty() && child.elements.empty()
+                                           ? '=' + child.text
+                                           : ValuesOf(child));
+    }
+    std::stable_sort(items.begin(), items.end(),
+                     [](const auto& a, const auto& b) { return a.first < b.first; });
+    std::string values = "{";
+    for (const auto& [name, value] : items) {
+        // A line end can't stand in a name, nor in a value that is sound.
+        values.append(name).append(value) += '\n';
+    }
+    return values + '}';
+}
+
 class RecordReader {
 public:
     explicit RecordReader(Findings& findings)
@@ -124,6 +146,7 @@ private:
         }
         record->id = *id;
         record->place = entry.place;
+        record->values = ValuesOf(entry);
         return record;
     }
 

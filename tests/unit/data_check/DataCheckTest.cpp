@@ -413,17 +413,41 @@ TEST_F(DataChecks, FindARepeatThatServesNothing) {
                 Contains(AllOf(HasSubstr("AAFInfo.xml:4:1: "), HasSubstr("it is a repeat"))));
 }
 
+TEST_F(DataChecks, FindTwoRecordsOfOnePictureThatDiffer) {
+    const std::string other = Record(With("ColorSiting", "4"));
+    EXPECT_THAT(Check(Record(Good()) + other),
+                ElementsAre(AllOf(HasSubstr("AAFInfo.xml:3:1: a picture of 720x480"),
+                                  HasSubstr("line 2 instead of this one; make the two alike"))));
+    EXPECT_THAT(
+        Check(Record(Good()) + Record(Good()) + other),
+        ElementsAre(HasSubstr("AAFInfo.xml:3:1: "),
+                    AllOf(HasSubstr("AAFInfo.xml:4:1: "), HasSubstr("make the two alike"))));
+    // The same in another form is no other record.
+    Values values = Good();
+    values.erase("rp210:ColorSiting");
+    EXPECT_THAT(
+        Check(Record(Good()) + Record(values, "10000", "CDCI",
+                                      "<rp210:ColorSiting>0</rp210:ColorSiting><rp210:VideoLineMap>"
+                                      "<rp210:Element>23</rp210:Element></rp210:VideoLineMap>")),
+        IsEmpty());
+    EXPECT_THAT(
+        Check(Record(Good()) + Record(Good(), "10000", "CDCI",
+                                      "<rp210:VideoLineMap><rp210:Element>24</rp210:Element>"
+                                      "</rp210:VideoLineMap>")),
+        ElementsAre(HasSubstr("make the two alike")));
+}
+
 TEST_F(DataChecks, FindRecordsBehindOthers) {
     const auto inLineTwo = HasSubstr("finds the record of id 10000 in line 2 instead of this one");
     // 486 lines pass for 480 by the rule of six lines more.
     EXPECT_THAT(Check(Record(Sized("720", "480")) + Record(Sized("720", "486"))),
                 Contains(AllOf(HasSubstr("AAFInfo.xml:3:1: a picture of 720x486"), inLineTwo)));
     EXPECT_THAT(Check(Record(Sized("720", "486")) + Record(Sized("720", "480"))), IsEmpty());
-    // Fields pass for frames and the reverse.
+    // Fields pass for frames and the reverse, so no order helps.
     EXPECT_THAT(Check(Record(Sized("1920", "1080")) + Record(Sized("1920", "540"))),
-                Contains(AllOf(HasSubstr("1920x540"), inLineTwo)));
+                ElementsAre(AllOf(HasSubstr("1920x540"), inLineTwo, HasSubstr("another id"))));
     EXPECT_THAT(Check(Record(Sized("1920", "540")) + Record(Sized("1920", "1080"))),
-                Contains(AllOf(HasSubstr("1920x1080"), inLineTwo)));
+                ElementsAre(AllOf(HasSubstr("1920x1080"), inLineTwo, HasSubstr("another id"))));
     EXPECT_THAT(Check(Record(Sized("1440", "540")) + Record(Sized("1920", "540"))), IsEmpty());
 }
 
