@@ -18,6 +18,7 @@ using ::testing::Contains;
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
 using ::testing::IsEmpty;
+using ::testing::Not;
 using Texts = std::vector<std::string>;
 
 // Each on one line as "file:line:column: what; what helps".
@@ -468,6 +469,49 @@ TEST_F(DataChecks, FindCodesThatLeadNowhere) {
                     HasSubstr("FourCharMapper.xml:4:1: code \"dvpp\" leads to no id; give it")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10000'") + Row("apch", "")),
                 Contains(HasSubstr("code \"apch\" leads to no id; give the code a second row")));
+}
+
+TEST_F(DataChecks, LeaveTheIdToTheMovieWhereItsRecordIsThere) {
+    const std::string rows = Row("dvc ", "vcid='10000'") + Row("AVxx", "");
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "10900") + Record(Good(), "10900"), rows),
+                IsEmpty());
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "10999") + Record(Good(), "10999"), rows),
+                IsEmpty());
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "11000"), rows),
+                Contains(HasSubstr("code \"AVxx\" leads to no id")));
+    EXPECT_THAT(
+        Check(Record(Good()), rows),
+        ElementsAre(HasSubstr("FourCharMapper.xml:3:1: code \"AVxx\" leads to no id; give it "
+                              "a vcid, or AAFInfo.xml a record with an id of those that "
+                              "movies name themselves, 10900 to 10999")));
+    EXPECT_THAT(Check(Record(Good()) + "<MediaDescriptorSignature/>", rows),
+                Not(Contains(HasSubstr("AVxx"))))
+        << "the record that is broken may be the one";
+}
+
+TEST_F(DataChecks, FindRepeatedRowsWithoutAnId) {
+    const std::string records = Record(Good()) + Record(Good(), "10900") + Record(Good(), "10900");
+    const std::string dvc = Row("dvc ", "vcid='10000'");
+    const auto inLineFour = HasSubstr(
+        "FourCharMapper.xml:4:1: this row of \"AVxx\" serves no movie; take it out: one before it "
+        "counts");
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "") + Row("AVxx", "")), ElementsAre(inLineFour));
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "Vendor='appl'") + Row("AVxx", "Vendor='appl'")),
+                ElementsAre(inLineFour));
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "Vendor='appl' vcid='10000'") +
+                                   Row("AVxx", "Vendor='appl'")),
+                ElementsAre(inLineFour));
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "") + Row("AVxx", "Vendor='appl'")), IsEmpty());
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "") + Row("AVxx", "vcid='10000'")), IsEmpty());
+}
+
+// Two rows are what it takes to have the table asked.
+TEST_F(DataChecks, FindAThirdRowOfACodeOfTheModulesTable) {
+    const std::string two = Row("apch", "") + Row("apch", "");
+    EXPECT_THAT(Check(Record(Good()), two), Not(Contains(HasSubstr("serves no movie"))));
+    EXPECT_THAT(
+        Check(Record(Good()), two + Row("apch", "")),
+        Contains(HasSubstr("FourCharMapper.xml:4:1: this row of \"apch\" serves no movie")));
 }
 
 TEST_F(DataChecks, FindRastersOfTheModulesTableWithoutARecord) {
