@@ -34,6 +34,29 @@ public:
         }
     }
 
+    // Pairs elements whose key may change with the one of their kind, where it is the only one that
+    // is left in both lists.
+    void PairTheOnlyOnes() {
+        std::map<std::string, std::vector<std::size_t>> places;
+        for (std::size_t i = 0; i < after_.size(); ++i) {
+            if (!isTaken_[i] && after_[i].mayChangeKey) {
+                places[after_[i].kind].push_back(i);
+            }
+        }
+        std::map<std::string, std::vector<std::size_t>> left;
+        for (std::size_t i = 0; i < before_.size(); ++i) {
+            if (!found_[i] && before_[i].mayChangeKey) {
+                left[before_[i].kind].push_back(i);
+            }
+        }
+        for (const auto& [kind, those] : left) {
+            const auto there = places.find(kind);
+            if (those.size() == 1 && there != places.end() && there->second.size() == 1) {
+                Pair(those.front(), there->second.front());
+            }
+        }
+    }
+
     // Takes back pairs of elements without a key until all that are left run in one order: as few
     // as can be.
     void KeepOrder() {
@@ -142,6 +165,7 @@ std::vector<std::optional<std::size_t>> MatchLists(const std::vector<ListElement
                                              std::to_string(element.content))
                    : "";
     });
+    matching.PairTheOnlyOnes();
     if (isSet) {
         matching.PairRest();
     } else {

@@ -26,6 +26,9 @@ constexpr const char* kLeftOut[] = {"CreationTime", "Generation", "LastModified"
 
 constexpr char kSlotId[] = "SlotID";
 
+// What names slots elsewhere, which may have other numbers now.
+constexpr const char* kSlotReferences[] = {"LinkedSlotID", "SourceMobSlotID"};
+
 // The properties by which an object of a list is found again; the first that it has counts.
 constexpr const char* kKeys[] = {kSlotId, "Identification", "Definition", "Name"};
 
@@ -37,8 +40,13 @@ constexpr std::size_t kShownBefore = 30;  // of what two long values have in com
 // Objects with no more facts are told whole.
 constexpr std::size_t kFewFacts = 2;
 
+template <std::size_t count>
+bool IsOneOf(const char* const (&names)[count], const std::string& name) {
+    return std::find(std::begin(names), std::end(names), name) != std::end(names);
+}
+
 bool IsLeftOut(const std::string& name) {
-    return std::find(std::begin(kLeftOut), std::end(kLeftOut), name) != std::end(kLeftOut);
+    return IsOneOf(kLeftOut, name);
 }
 
 const TreeNode::Fact* FindFact(const TreeNode& node, std::string_view name) {
@@ -136,11 +144,11 @@ std::size_t Mixed(std::size_t hash, std::string_view text) {
     return (hash ^ std::hash<std::string_view>()(text)) * kFactor;
 }
 
-// Equal for equal objects, but perhaps for their keys.
+// Equal for equal objects, but perhaps for their keys and the numbers of slots.
 std::size_t HashOf(const TreeNode& node, const TreeNode::Fact* key) {
     std::size_t hash = Mixed(node.facts.size(), node.title);
     for (const TreeNode::Fact& fact : node.facts) {
-        if (&fact != key && !IsLeftOut(fact.name)) {
+        if (&fact != key && !IsLeftOut(fact.name) && !IsOneOf(kSlotReferences, fact.name)) {
             hash = Mixed(Mixed(hash, fact.name), fact.value);
         }
     }

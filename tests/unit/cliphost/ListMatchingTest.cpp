@@ -36,6 +36,18 @@ TEST(ListMatching, FindsOneOfAnotherKeyByItsContentWhereThatMayBe) {
     EXPECT_EQ(MatchLists({Keyed("3", 7)}, {Keyed("4", 7)}, false), Places{kNone});
 }
 
+TEST(ListMatching, FindsTheOnlyOneOfItsKindThatIsLeftWhereItsKeyMayChange) {
+    EXPECT_EQ(MatchLists({Keyed("1", 7, true), Keyed("2", 8, true)},
+                         {Keyed("1", 7, true), Keyed("3", 9, true)}, false),
+              (Places{0, 1}));
+    EXPECT_EQ(MatchLists({Keyed("2", 8)}, {Keyed("3", 9)}, false), Places{kNone});
+    EXPECT_EQ(MatchLists({Keyed("2", 8, true)}, {Keyed("3", 9, true), Keyed("4", 9, true)}, false),
+              Places{kNone})
+        << "of two, nobody knows which";
+    EXPECT_EQ(MatchLists({Keyed("2", 8, true), Keyed("3", 7, true)}, {Keyed("4", 9, true)}, false),
+              (Places{kNone, kNone}));
+}
+
 TEST(ListMatching, NeverTakesOneKindForAnother) {
     EXPECT_EQ(MatchLists({Loose(1, "clip")}, {Loose(1, "gap")}, false), Places{kNone});
     EXPECT_EQ(MatchLists({{"1", 0, "picture", true}}, {{"1", 0, "sound", true}}, false),

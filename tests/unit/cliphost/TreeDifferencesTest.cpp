@@ -99,6 +99,30 @@ TEST(TreeDifferences, FindASlotThatHasAnotherNumberNow) {
               (Texts{"picture slot 1: slot id 1 -> 2", "sound slot 1 new"}));
 }
 
+// The slots behind it are numbered anew.
+TEST(TreeDifferences, TellASlotThatWentAndAChangeInOneBehindIt) {
+    EXPECT_EQ(Differences(Mob({Timecode("1"), Timecode("2", "9"), Picture("3", "250")}),
+                          Mob({Timecode("1"), Picture("2", "251")})),
+              (Texts{"second timecode slot (2) gone", "picture slot 3: slot id 3 -> 2",
+                     "picture slot 3: length 250 -> 251"}));
+}
+
+// So are those of the mob that a slot leads to.
+TEST(TreeDifferences, FindASlotThatLeadsToAnotherNumber) {
+    const auto leading = [](const std::string& id, const std::string& to,
+                            const std::string& length) {
+        TreeNode slot = Sound(id, length);
+        slot.branches[0].nodes[0].facts.push_back({"SourceMobSlotID", to});
+        return slot;
+    };
+    EXPECT_EQ(Differences(Mob({leading("4", "3", "8"), leading("5", "4", "9")}),
+                          Mob({leading("3", "2", "8"), leading("2", "3", "9")})),
+              (Texts{"first sound slot (4): slot id 4 -> 3",
+                     "first sound slot (4): source mob slot id 3 -> 2",
+                     "second sound slot (5): slot id 5 -> 2",
+                     "second sound slot (5): source mob slot id 4 -> 3"}));
+}
+
 TEST(TreeDifferences, TellASlotThatHoldsAnotherKindAsGoneAndNew) {
     EXPECT_EQ(Differences(Mob({Picture("1", "250")}), Mob({Sound("1", "7")})),
               (Texts{"picture slot 1 gone", "sound slot 1 new"}));
