@@ -24,6 +24,15 @@ ordered_json OrNull(const std::optional<std::string>& text) {
     return text ? ordered_json(*text) : ordered_json();
 }
 
+// Of an object that is there in one file alone, the difference is the whole.
+bool IsOfWhole(const TreeDifference& difference) {
+    return difference.place.empty() && difference.property.empty();
+}
+
+std::string WholeInWords(const ComparedObject& object, const TreeDifference& difference) {
+    return fmt::format("{} {}", InWords(object), NameOf(difference.kind));
+}
+
 std::string LineOf(const std::string& margin, const std::string& text) {
     return fmt::format("{}{}\n", margin, host::text::Printable(text));
 }
@@ -31,14 +40,12 @@ std::string LineOf(const std::string& margin, const std::string& text) {
 }  // namespace
 
 void ComparisonLines::Take(const ComparedObject& object, const TreeDifference& difference) {
-    const std::string name = InWords(object);
-    // Of an object that is there in one file alone, the line is the whole.
-    if (difference.place.empty() && difference.kind != TreeDifference::Kind::Changed &&
-        difference.kind != TreeDifference::Kind::Reordered) {
-        fmt::print("{}", LineOf("", fmt::format("{} {}", name, NameOf(difference.kind))));
+    if (IsOfWhole(difference)) {
+        fmt::print("{}", LineOf("", WholeInWords(object, difference)));
         told_.clear();
         return;
     }
+    const std::string name = InWords(object);
     const std::string whole = name + object.id;
     if (told_ != whole) {
         fmt::print("{}", LineOf("", name));
@@ -68,14 +75,15 @@ void ComparisonLines::Finish(const ComparisonCounts& counts) {
 }
 
 ordered_json ToJson(const ComparedObject& object, const TreeDifference& difference) {
-    return {{"object",
-             {{"class", object.kind}, {"id", OrNull(object.id)}, {"name", OrNull(object.name)}}},
-            {"kind", NameOf(difference.kind)},
-            {"place", difference.place},
-            {"property", OrNull(difference.property)},
-            {"before", OrNull(difference.before)},
-            {"after", OrNull(difference.after)},
-            {"words", InWords(difference)}};
+    return {
+        {"object",
+         {{"class", object.kind}, {"id", OrNull(object.id)}, {"name", OrNull(object.name)}}},
+        {"kind", NameOf(difference.kind)},
+        {"place", difference.place},
+        {"property", OrNull(difference.property)},
+        {"before", OrNull(difference.before)},
+        {"after", OrNull(difference.after)},
+        {"words", IsOfWhole(difference) ? WholeInWords(object, difference) : InWords(difference)}};
 }
 
 ordered_json ToJson(const ComparisonCounts& counts) {
