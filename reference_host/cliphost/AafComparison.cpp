@@ -227,7 +227,7 @@ private:
 std::string InWords(const ComparedObject& object) {
     std::string text = PropertyWords(object.kind);
     if (!object.name.empty()) {
-        text += fmt::format(" \"{}\"", object.name);
+        text += fmt::format(" \"{}\"", Shown(object.name));
     } else if (!object.id.empty()) {
         text += ' ' + object.id;
     }

@@ -7,6 +7,7 @@
 #include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/util/text/Printable.h"
@@ -74,10 +75,41 @@ void ComparisonLines::Finish(const ComparisonCounts& counts) {
     fmt::print("{}\n", text);
 }
 
+ComparisonJson::ComparisonJson(const ordered_json& head, Form form, std::size_t spaces)
+    : form_(form), spaces_(spaces) {
+    std::string text = Text(head, 0);
+    text.pop_back();
+    text.resize(text.find_last_not_of(" \n") + 1);
+    fmt::print("{}{},{}\"differences\": [", std::string(spaces_, ' '), text, LineEnd(1));
+}
+
+void ComparisonJson::Take(const ComparedObject& object, const TreeDifference& difference) {
+    fmt::print("{}{}{}", isFirst_ ? "" : ",", LineEnd(2), Text(ToJson(object, difference), 2));
+    isFirst_ = false;
+}
+
+void ComparisonJson::Finish(const ComparisonCounts& counts) {
+    fmt::print("{}],{}\"counts\": {}{}}}{}", isFirst_ ? "" : LineEnd(1), LineEnd(1),
+               Text(ToJson(counts), 1), LineEnd(0), spaces_ == 0 ? "\n" : "");
+}
+
+// Without what indents its first line.
+std::string ComparisonJson::Text(const ordered_json& json, std::size_t level) const {
+    if (form_ == Form::OneLine) {
+        return json.dump(-1, ' ', false, ordered_json::error_handler_t::replace);
+    }
+    const std::size_t indentation = spaces_ + 2 * level;
+    return InLines(json, indentation).substr(indentation);
+}
+
+std::string ComparisonJson::LineEnd(std::size_t level) const {
+    return form_ == Form::OneLine ? "" : '\n' + std::string(spaces_ + 2 * level, ' ');
+}
+
 ordered_json ToJson(const ComparedObject& object, const TreeDifference& difference) {
     return {
         {"object",
-         {{"class", object.kind}, {"id", OrNull(object.id)}, {"name", OrNull(object.name)}}},
+         {{"class", object.kind}, {"id", OrNull(object.id)}, {"name", OrNull(Shown(object.name))}}},
         {"kind", NameOf(difference.kind)},
         {"place", difference.place},
         {"property", OrNull(difference.property)},

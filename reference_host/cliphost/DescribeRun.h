@@ -41,7 +41,11 @@ private:
     void WriteColumns() const;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
     void SaveBin();
+    Problem WhyNotCompared() const;
     void TellDifferences();
+    template <class Printer>
+    void PrintDifferences(Printer& printer);
+    void PrintEntries();
     void PrintSummary(int described, int failed) const;
     void AddEntry(const nlohmann::ordered_json& head, const std::string& description);
 

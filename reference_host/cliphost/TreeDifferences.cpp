@@ -122,7 +122,7 @@ public:
             return fmt::format("{} {} ({})", Ordinal(at + 1), OneOf(list_.name), node.title);
         }
         if (key->name != kSlotId) {
-            return fmt::format("{} {}", OneOf(list_.name), key->value);
+            return fmt::format("{} {}", OneOf(list_.name), Shown(key->value));
         }
         if (ordinals_[at] == 0) {
             return fmt::format("slot {}", key->value);
@@ -194,10 +194,6 @@ std::string Piece(const std::string& value, std::size_t start) {
                        piece.size() < rest.size() ? "..." : "");
 }
 
-std::string Shown(const std::string& value) {
-    return Piece(value, 0);
-}
-
 // Two values so that it is seen in what they differ.
 std::string Shown(const std::string& before, const std::string& after) {
     std::size_t start = 0;
@@ -218,6 +214,10 @@ bool IsUnread(const std::string& value) {
 }
 
 }  // namespace
+
+std::string Shown(const std::string& value) {
+    return Piece(value, 0);
+}
 
 const char* NameOf(Kind kind) {
     constexpr const char* kNames[] = {"changed", "gone", "new", "reordered"};

@@ -32,6 +32,9 @@ const char* NameOf(TreeDifference::Kind kind);
 // where they begin to differ.
 std::string InWords(const TreeDifference& difference);
 
+// A name or value for people, cut where it is long.
+std::string Shown(const std::string& value);
+
 // "EditRate" -> "edit rate"
 std::string PropertyWords(const std::string& name);
 

@@ -141,6 +141,44 @@ TEST_F(CompareVerb, AnswersInJson) {
     EXPECT_EQ(same["differences"], Json::array());
 }
 
+// What can't be written to its end tells nobody that the files are alike, or that this is all.
+TEST_F(CompareVerb, FailsWhereItsAnswerCanNotBeWritten) {
+    Describe(Movie("1/a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("2/a.mov", 11, 3), "--aaf " + In("b.aaf"));
+    const std::string program = Quoted(ProgramFolder() / "cliphost") + " compare ";
+    for (const std::string form : {"", "--json "}) {
+        for (const std::string& files :
+             {In("a.aaf") + " " + In("a.aaf"), In("a.aaf") + " " + In("b.aaf")}) {
+            const CommandResult full = RunCommand(program + form + files + " 2>&1 >/dev/full");
+            EXPECT_EQ(full.status, 2);
+            EXPECT_EQ(full.out.find("cliphost: standard output: not written: No space left"), 0u)
+                << full.out;
+        }
+        // In the middle.
+        const CommandResult cut =
+            RunCommand("ulimit -f 1; exec " + program + form + In("a.aaf") + " " + In("b.aaf") +
+                       " 2>" + In("told") + " >" + In("answer"));
+        EXPECT_EQ(cut.status, 2);
+        const movies::Bytes answer = ReadFile(folder() / "answer");
+        EXPECT_FALSE(answer.empty());
+        EXPECT_FALSE(Json::accept(answer));
+        const movies::Bytes told = ReadFile(folder() / "told");
+        EXPECT_NE(std::string(told.begin(), told.end()).find("standard output: not written: "),
+                  std::string::npos);
+    }
+}
+
+// Who has seen a difference may stop reading.
+TEST_F(CompareVerb, TellsADifferenceByItsStatusToAReaderThatGoes) {
+    Describe(Movie("1/a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("2/a.mov", 11, 9), "--aaf " + In("b.aaf"));
+    const CommandResult ran =
+        RunCommand("bash -c " +
+                   Quoted("exec 3> >(true); wait $!; " + Quoted(ProgramFolder() / "cliphost") +
+                          " compare --json " + In("a.aaf") + " " + In("b.aaf") + " >&3; echo $?"));
+    EXPECT_EQ(ran.out, "1\n");
+}
+
 // Of long values the first bytes are shown; the last ones count as well.
 TEST_F(CompareVerb, SeesADifferenceBehindWhatItShowsOfAValue) {
     Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));

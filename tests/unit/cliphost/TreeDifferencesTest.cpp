@@ -215,6 +215,14 @@ TEST(TreeDifferences, ShowLongValuesWhereTheyBeginToDiffer) {
     EXPECT_NE(texts[0].find("second"), std::string::npos) << texts[0];
 }
 
+TEST(TreeDifferences, CutLongNames) {
+    const std::string name(1u << 20, 'x');
+    TreeComparison([&](const TreeDifference& one) {
+        ASSERT_EQ(one.place.size(), 1u);
+        EXPECT_LT(one.place[0].size(), 500u);
+    }).Compare(Comments({Comment(name, "1")}), Comments({Comment(name, "2")}));
+}
+
 TEST(TreeDifferences, CutLongValuesBetweenCharacters) {
     std::string text;
     for (int i = 0; i < 300; ++i) {
