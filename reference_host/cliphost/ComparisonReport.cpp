@@ -31,7 +31,7 @@ bool IsOfWhole(const TreeDifference& difference) {
 }
 
 std::string WholeInWords(const ComparedObject& object, const TreeDifference& difference) {
-    return fmt::format("{} {}", InWords(object), NameOf(difference.kind));
+    return InWords(object) + InWords(difference);
 }
 
 std::string LineOf(const std::string& margin, const std::string& text) {
@@ -72,6 +72,7 @@ void ComparisonLines::Finish(const ComparisonCounts& counts) {
     add(counts.changed, "changed");
     add(counts.gone, "gone");
     add(counts.added, "new");
+    add(counts.unknown, "not described");
     fmt::print("{}\n", text);
 }
 
@@ -124,6 +125,7 @@ ordered_json ToJson(const ComparisonCounts& counts) {
             {"changed", counts.changed},
             {"gone", counts.gone},
             {"new", counts.added},
+            {"notDescribed", counts.unknown},
             {"unread", counts.unread}};
 }
 

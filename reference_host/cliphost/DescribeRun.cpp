@@ -6,6 +6,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include "reference_host/cliphost/AafClips.h"
+#include "reference_host/cliphost/AafValue.h"
 #include "reference_host/cliphost/ComparisonReport.h"
 #include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/JsonAnswer.h"
@@ -180,6 +182,9 @@ bool DescribeRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
 }
 
 void DescribeRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    if (against_) {
+        failures_.emplace(AbsolutePath(movie), problem.reason);
+    }
     if (options_.form.json) {
         ordered_json head = {{"movie", MachinePath(movie)}};
         AddProblem(problem, head);
@@ -234,6 +239,37 @@ Problem DescribeRun::WhyNotCompared() const {
                                  : Problem{};
 }
 
+// Those of clips whose locators name a movie that failed, or one in a folder that failed.
+UnknownMobs DescribeRun::MobsOfFailures() const {
+    UnknownMobs mobs;
+    if (failures_.empty()) {
+        return mobs;
+    }
+    PathMaps maps = options_.form.maps;
+    for (const AafClip& clip : ClipsOf(against_.get())) {
+        for (std::string url : clip.urls) {
+            maps.MapToThis(url);
+            UrlPlace place;
+            if (!ReadFileUrl(url, place) || !place.machine.empty()) {
+                continue;
+            }
+            auto failure = failures_.end();
+            for (std::filesystem::path path = AbsolutePath(place.path);
+                 failure == failures_.end() && path.has_relative_path();
+                 path = path.parent_path()) {
+                failure = failures_.find(path);
+            }
+            if (failure != failures_.end()) {
+                mobs.emplace(ToText(clip.id), failure->second);
+                for (const aafMobID_t& source : clip.sources) {
+                    mobs.emplace(ToText(source), failure->second);
+                }
+            }
+        }
+    }
+    return mobs;
+}
+
 // As if the bin had been saved and was compared then.
 void DescribeRun::TellDifferences() {
     if (!options_.form.json) {
@@ -250,11 +286,12 @@ void DescribeRun::TellDifferences() {
 
 template <class Printer>
 void DescribeRun::PrintDifferences(Printer& printer) {
-    const ComparisonCounts counts =
-        CompareFiles(against_.get(), bin_->file(),
-                     [&](const ComparedObject& object, const TreeDifference& difference) {
-                         printer.Take(object, difference);
-                     });
+    const ComparisonCounts counts = CompareFiles(
+        against_.get(), bin_->file(),
+        [&](const ComparedObject& object, const TreeDifference& difference) {
+            printer.Take(object, difference);
+        },
+        MobsOfFailures());
     CountStatus(StatusOf(counts));
     printer.Finish(counts);
 }

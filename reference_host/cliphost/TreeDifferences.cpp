@@ -220,7 +220,7 @@ std::string Shown(const std::string& value) {
 }
 
 const char* NameOf(Kind kind) {
-    constexpr const char* kNames[] = {"changed", "gone", "new", "reordered"};
+    constexpr const char* kNames[] = {"changed", "gone", "new", "reordered", "notDescribed"};
     return kNames[static_cast<std::size_t>(kind)];
 }
 
@@ -257,6 +257,8 @@ std::string InWords(const TreeDifference& difference) {
         case Kind::Reordered:
             return fmt::format("{}{}{} in another order", text, text.empty() ? "" : ": ",
                                PropertyWords(difference.property));
+        case Kind::Unknown:
+            return fmt::format("{} not described: {}", text, difference.reason);
         case Kind::Changed:
             break;
     }

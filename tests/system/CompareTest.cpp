@@ -323,4 +323,68 @@ TEST_F(DescribeAgainst, ComparesNothingWhereNoMovieIsDescribed) {
                "a.aaf: not compared: no movie was described");
 }
 
+// Nothing is known of what became of it.
+TEST_F(DescribeAgainst, TellsAMovieThatCanNotBeDescribedAsThatAndNotAsGone) {
+    Movie("in/a.mov", 10);
+    Movie("in/b.mov", 11);
+    Describe(In("in"), "--bin " + In("old.aaf"));
+    std::ofstream(folder() / "in/b.mov") << "no movie at all";
+    for (const char* const jobs : {"1", "2"}) {
+        const CommandResult compared = RunCliphost("describe " + In("in") + " --against " +
+                                                   In("old.aaf") + " --jobs " + std::string(jobs));
+        ExpectSays(compared, 1, "master mob \"b\" not described: ");
+        ExpectSays(compared, 1, "source mob \"b\" (MultipleDescriptor) not described: ");
+        ExpectSays(compared, 1, "no differences: 3 objects alike, 3 objects not described\n");
+        EXPECT_EQ(compared.out.find(" gone"), std::string::npos) << compared.out;
+    }
+    const CommandResult json =
+        Answer("describe " + In("in") + " --json --against " + In("old.aaf"));
+    EXPECT_EQ(json.status, 1);
+    const Json last = Json::parse(json.out).back();
+    EXPECT_EQ(last["counts"]["differences"], 0);
+    EXPECT_EQ(last["counts"]["gone"], 0);
+    EXPECT_EQ(last["counts"]["notDescribed"], 3);
+    ASSERT_EQ(last["differences"].size(), 3u);
+    EXPECT_EQ(last["differences"][0]["kind"], "notDescribed");
+    EXPECT_EQ(last["differences"][0]["before"], "MasterMob");
+    EXPECT_EQ(last["differences"][0]["after"], nullptr);
+}
+
+// It would pass for the only clip of another name.
+TEST_F(DescribeAgainst, TakesNoOtherMovieForOneThatCanNotBeDescribed) {
+    Describe(Movie("in/a.mov", 10), "--aaf " + In("a.aaf"));
+    std::ofstream(folder() / "in/a.mov") << "no movie at all";
+    const CommandResult compared = RunCliphost("describe " + In("in/a.mov") + " " +
+                                               Movie("in/b.mov", 11) + " --against " + In("a.aaf"));
+    ExpectSays(compared, 1, "master mob \"a\" not described: ");
+    ExpectSays(compared, 1, "master mob \"b\" new\n");
+    ExpectSays(compared, 1, "3 differences: 3 objects new, 3 objects not described\n");
+}
+
+TEST_F(DescribeAgainst, KnowsTheMoviesOfAFolderThatFailsAndOfAnotherMachinesPlaces) {
+    Movie("in/a.mov", 10);
+    Movie("in/sub/b.mov", 11);
+    const std::string map = " --map " + Quoted((folder() / "in").string() + "=//server/media");
+    const std::string call = In("in") + " " + In("in/sub") + map;
+    Describe(call, "--bin " + In("old.aaf"));
+    fs::remove_all(folder() / "in/sub");
+    const CommandResult compared = RunCliphost("describe " + call + " --against " + In("old.aaf"));
+    ExpectSays(compared, 2, "master mob \"b\" not described: there is no such file or folder\n");
+    ExpectSays(compared, 2, "no differences: 3 objects alike, 3 objects not described\n");
+}
+
+TEST_F(DescribeAgainst, TellsAMovieThatWentAsGoneBesideOneThatFails) {
+    Movie("in/a.mov", 10);
+    Movie("in/b.mov", 11);
+    Movie("in/c.mov", 12);
+    Describe(In("in"), "--bin " + In("old.aaf"));
+    std::ofstream(folder() / "in/b.mov") << "no movie at all";
+    fs::remove(folder() / "in/c.mov");
+    const CommandResult compared =
+        RunCliphost("describe " + In("in") + " --against " + In("old.aaf"));
+    ExpectSays(compared, 1, "master mob \"c\" gone\n");
+    ExpectSays(compared, 1,
+               "3 differences: 3 objects alike, 3 objects gone, 3 objects not described\n");
+}
+
 }  // namespace
