@@ -247,7 +247,8 @@ std::string InWords(const TreeDifference& difference) {
         text += (text.empty() ? "" : ": ") + place;
     }
     const auto in = [](const std::optional<std::string>& object) {
-        return object->find(' ') == std::string::npos ? "" : fmt::format(" ({})", Shown(*object));
+        const bool saysMore = object && object->find(' ') != std::string::npos;
+        return saysMore ? fmt::format(" ({})", Shown(*object)) : std::string();
     };
     switch (difference.kind) {
         case Kind::Gone:

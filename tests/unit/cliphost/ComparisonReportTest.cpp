@@ -35,6 +35,13 @@ TEST(ComparisonInJson, NamesAnObjectThatIsGoneOrNewInItsWords) {
               "source mob urn:b (ImportDescriptor) gone");
 }
 
+TEST(ComparisonInJson, SaysOfAnObjectThatNothingIsKnownAndWhy) {
+    TreeDifference unknown = Whole(Kind::Unknown);
+    unknown.reason = "no movie";
+    EXPECT_EQ(WordsOf(kClip, unknown), "master mob \"clip\" not described: no movie");
+    EXPECT_EQ(ToJson(kClip, unknown)["kind"], "notDescribed");
+}
+
 TEST(ComparisonInJson, LeavesTheNameOutOfWhatIsOtherInAnObject) {
     TreeDifference changed;
     changed.property = "Length";
