@@ -107,7 +107,14 @@ TEST(TreeDifferences, TellASlotThatWentAndAChangeInOneBehindIt) {
                      "picture slot 3: length 250 -> 251"}));
 }
 
-// So are those of the mob that a slot leads to.
+TEST(TreeDifferences, KeepTheOrderOfSlotsThatAreNumberedAnew) {
+    EXPECT_EQ(Differences(Mob({Sound("2", "8"), Sound("3", "9")}),
+                          Mob({Picture("2"), Sound("3", "8"), Sound("4", "9")})),
+              (Texts{"first sound slot (2): slot id 2 -> 3",
+                     "second sound slot (3): slot id 3 -> 4", "picture slot 2 new"}));
+}
+
+// The mob that a slot leads to has other numbers, too.
 TEST(TreeDifferences, FindASlotThatLeadsToAnotherNumber) {
     const auto leading = [](const std::string& id, const std::string& to,
                             const std::string& length) {
@@ -116,11 +123,9 @@ TEST(TreeDifferences, FindASlotThatLeadsToAnotherNumber) {
         return slot;
     };
     EXPECT_EQ(Differences(Mob({leading("4", "3", "8"), leading("5", "4", "9")}),
-                          Mob({leading("3", "2", "8"), leading("2", "3", "9")})),
-              (Texts{"first sound slot (4): slot id 4 -> 3",
-                     "first sound slot (4): source mob slot id 3 -> 2",
-                     "second sound slot (5): slot id 5 -> 2",
-                     "second sound slot (5): source mob slot id 4 -> 3"}));
+                          Mob({leading("3", "2", "9")})),
+              (Texts{"first sound slot (4) gone", "second sound slot (5): slot id 5 -> 3",
+                     "second sound slot (5): source mob slot id 4 -> 2"}));
 }
 
 TEST(TreeDifferences, TellASlotThatHoldsAnotherKindAsGoneAndNew) {
