@@ -75,7 +75,7 @@ constexpr char kLineMap[] = "rp210:VideoLineMap";
 constexpr NumberRule kLine = {"rp210:Element", IsAny, kAny, true};
 constexpr char kPixelLayout[] = "rp210:PixelLayout";
 constexpr char kComponent[] = "rp210:RGBALayout";
-constexpr char kCode[] = "rp210:Code";
+constexpr char kLetter[] = "rp210:Code";
 constexpr char kProfile[] = "rp210:ProfileAndLevel";
 constexpr const char* kLabels[] = {"rp210:PictureEssenceCoding", "rp210:EssenceContainerLabel"};
 
@@ -376,8 +376,9 @@ private:
                 continue;
             }
             ++components;
-            reader_.CheckNames(component, {kCode, kDepth.name});
-            if (const auto code = reader_.One(component, kCode, "give the letter of a component")) {
+            reader_.CheckNames(component, {kLetter, kDepth.name});
+            if (const auto code =
+                    reader_.One(component, kLetter, "give the letter of a component")) {
                 CheckLetter(*code, letters);
                 letters += code->value[0];
             }
@@ -400,10 +401,10 @@ private:
     void CheckLetter(const Item& code, const std::string& before) {
         const char letter = code.value[0];
         if (code.value.size() > 1) {
-            reader_.Tell(code.place, fmt::format("{} is more than one letter", kCode),
+            reader_.Tell(code.place, fmt::format("{} is more than one letter", kLetter),
                          "give one letter; the module takes the first");
         } else if (kComponents.find(letter) == kComponents.npos) {
-            reader_.Tell(code.place, fmt::format("{} can't be \"{}\"", kCode, letter),
+            reader_.Tell(code.place, fmt::format("{} can't be \"{}\"", kLetter, letter),
                          "give R, G, B, A (alpha), F (fill), P (palette) or 0 (none)");
         } else if (kOnce.find(letter) != kOnce.npos && before.find(letter) != before.npos) {
             reader_.Tell(code.place, fmt::format("{} stands here a second time", letter),
