@@ -323,6 +323,23 @@ TEST_F(DescribeAgainst, ComparesNothingWhereNoMovieIsDescribed) {
                "a.aaf: not compared: no movie was described");
 }
 
+TEST_F(DescribeAgainst, FailsWhereItsAnswerCanNotBeWritten) {
+    const std::string movie = Movie("in/a.mov", 10);
+    Describe(movie, "--aaf " + In("a.aaf"));
+    Movie("in/a.mov", 11, 3);
+    for (const std::string form : {"", "--json", "--jsonl"}) {
+        const CommandResult cut = RunCommand(
+            "ulimit -f 1; exec " + Quoted(ProgramFolder() / "cliphost") + " describe " + movie +
+            " " + form + " --against " + In("a.aaf") + " 2>" + In("told") + " >" + In("answer"));
+        EXPECT_EQ(cut.status, 2) << form;
+        const movies::Bytes answer = ReadFile(folder() / "answer");
+        EXPECT_FALSE(Json::accept(answer));
+        const movies::Bytes told = ReadFile(folder() / "told");
+        EXPECT_NE(std::string(told.begin(), told.end()).find("standard output: not written: "),
+                  std::string::npos);
+    }
+}
+
 // Nothing is known of what became of it.
 TEST_F(DescribeAgainst, TellsAMovieThatCanNotBeDescribedAsThatAndNotAsGone) {
     Movie("in/a.mov", 10);
