@@ -10,7 +10,8 @@ namespace data_check {
 namespace {
 
 constexpr std::size_t kLengthOfCode = 4;
-constexpr char kHintForCode[] = "write the four characters of the code; blanks count";
+constexpr char kHintForCode[] =
+    "write the four characters of the code, each of one byte; blanks count";
 constexpr NumberRule kVcid = {"vcid", IsId, "a whole number from 1 to 2147483647, or leave it out",
                               false};
 

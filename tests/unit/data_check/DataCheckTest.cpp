@@ -397,6 +397,10 @@ TEST_F(DataChecks, FindEntriesWithoutKeyOrDescriptor) {
                 Contains(HasSubstr("FourCharMapping lacks FourChar")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc", "vcid='1'")),
                 Contains(HasSubstr("FourChar must have four characters, not \"dvc\"")));
+    EXPECT_THAT(
+        Check(Record(Good()), Row("dv\xC3\xA9 ", "vcid='1'")),
+        Contains(HasSubstr("not \"dv\xC3\xA9 \"; write the four characters of the code, each "
+                           "of one byte")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10000' Vendor='applX'")),
                 Contains(HasSubstr("of Vendor only \"appl\" counts")));
 }
