@@ -239,7 +239,17 @@ Problem DescribeRun::WhyNotCompared() const {
                                  : Problem{};
 }
 
-// Those of clips whose locators name a movie that failed, or one in a folder that failed.
+// Null where neither the movie failed nor a folder that it lies in.
+const std::string* DescribeRun::WhyFailed(const std::filesystem::path& movie) const {
+    for (std::filesystem::path path = movie; path.has_relative_path(); path = path.parent_path()) {
+        if (const auto failure = failures_.find(path); failure != failures_.end()) {
+            return &failure->second;
+        }
+    }
+    return nullptr;
+}
+
+// Those of clips whose locators name a movie that failed.
 UnknownMobs DescribeRun::MobsOfFailures() const {
     UnknownMobs mobs;
     if (failures_.empty()) {
@@ -250,20 +260,14 @@ UnknownMobs DescribeRun::MobsOfFailures() const {
         for (std::string url : clip.urls) {
             maps.MapToThis(url);
             UrlPlace place;
-            if (!ReadFileUrl(url, place) || !place.machine.empty()) {
+            const bool isHere = ReadFileUrl(url, place) && place.machine.empty();
+            const std::string* const why = isHere ? WhyFailed(AbsolutePath(place.path)) : nullptr;
+            if (why == nullptr) {
                 continue;
             }
-            auto failure = failures_.end();
-            for (std::filesystem::path path = AbsolutePath(place.path);
-                 failure == failures_.end() && path.has_relative_path();
-                 path = path.parent_path()) {
-                failure = failures_.find(path);
-            }
-            if (failure != failures_.end()) {
-                mobs.emplace(ToText(clip.id), failure->second);
-                for (const aafMobID_t& source : clip.sources) {
-                    mobs.emplace(ToText(source), failure->second);
-                }
+            mobs.emplace(ToText(clip.id), *why);
+            for (const aafMobID_t& source : clip.sources) {
+                mobs.emplace(ToText(source), *why);
             }
         }
     }

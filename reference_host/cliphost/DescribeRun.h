@@ -44,6 +44,7 @@ private:
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
     void SaveBin();
     Problem WhyNotCompared() const;
+    const std::string* WhyFailed(const std::filesystem::path& movie) const;
     UnknownMobs MobsOfFailures() const;
     void TellDifferences();
     template <class Printer>
