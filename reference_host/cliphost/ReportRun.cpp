@@ -6,6 +6,7 @@
 
 #include <ctime>
 #include <fstream>
+#include <utility>
 
 #include "host_interfaces/Version.h"
 #include "reference_host/cliphost/CatalogFile.h"
@@ -15,11 +16,9 @@
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/ReportClip.h"
 #include "reference_host/cliphost/ReportOdd.h"
-#include "reference_host/cliphost/ReportPictures.h"
 #include "reference_host/cliphost/ReportShape.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
-#include "reference_host/report/PageText.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
@@ -28,8 +27,6 @@ namespace {
 using Json = nlohmann::ordered_json;
 
 constexpr char kEndingOfFolder[] = "_files";
-constexpr char kPoster[] = "poster";
-constexpr char kStrip[] = "strip";
 constexpr std::int64_t kNanoseconds = 1'000'000'000;
 
 const DescriptionForm& FormOfClip() {
@@ -75,11 +72,6 @@ std::string TitleOf(const ReportOptions& options) {
                                                   : whole.parent_path().filename());
 }
 
-// "00017-poster.webp"
-std::string PictureName(std::size_t number, const char* name, std::string_view type) {
-    return fmt::format("{:05}-{}.{}", number, name, type.substr(type.find('/') + 1));
-}
-
 }  // namespace
 
 void TakeCatalogs(ReportOptions& options) {
@@ -118,9 +110,8 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
     takesPlace_ = std::filesystem::exists(file, ignored);
     output_.emplace(file);
     if (options.isSplit) {
-        folder_ = file;
-        folder_.replace_filename(file.stem().native() + kEndingOfFolder);
-        madeFolder_.emplace(folder_);
+        std::filesystem::path folder = file;
+        pictures_.emplace(folder.replace_filename(file.stem().native() + kEndingOfFolder));
     }
     page_.emplace(
         [this](std::string_view text) {
@@ -210,40 +201,19 @@ void ReportRun::Add(const std::filesystem::path& movie, Json clip, bool hasFaile
     if (options_.json) {
         facts["details"] = std::move(details);
     } else {
-        PutBeside(facts, kPoster);
-        PutBeside(details, kStrip);
+        TakePictures(facts, details);
         page_->AddClip(clips_.size(), Dumped(details));
     }
     clips_.push_back(std::move(facts));
 }
 
-// Puts a picture's bytes into a file of the folder, where there is one.
-void ReportRun::PutBeside(Json& owner, const char* name) {
-    const auto picture = owner.find(name);
-    if (folder_.empty() || picture == owner.end()) {
+void ReportRun::TakePictures(Json& facts, Json& details) {
+    if (!pictures_) {
         return;
     }
-    const std::filesystem::path file =
-        folder_ / PictureName(clips_.size(), name, picture->value("type", std::string()));
-    const std::string bytes = report::FromBase64(picture->value("data", std::string()));
-    WriteWholeFile(file, {bytes.begin(), bytes.end()});
-    picture->erase("data");
-    (*picture)["file"] =
-        host::text::PercentEncoded((folder_.filename() / file.filename()).native());
-}
-
-// Those of an earlier page with more clips.
-void ReportRun::RemoveOldPictures() const {
-    for (std::size_t number = clips_.size();; ++number) {
-        std::error_code ignored;
-        bool isThere = false;
-        for (const std::string& name :
-             {PictureName(number, kPoster, kWebp), PictureName(number, kPoster, kPng),
-              PictureName(number, kStrip, kWebp)}) {
-            isThere = std::filesystem::remove(folder_ / name, ignored) || isThere;
-        }
-        if (!isThere) {
-            return;
+    for (const auto& [owner, name] : {std::pair(&facts, "poster"), std::pair(&details, "strip")}) {
+        if (const auto picture = owner->find(name); picture != owner->end()) {
+            pictures_->Take(*picture, clips_.size(), name);
         }
     }
 }
@@ -262,7 +232,13 @@ void ReportRun::WritePage() {
     }
     const std::size_t count = document["clips"].size();
     page_->End(Dumped(WithSchema(schema::kReport, std::move(document))));
+    if (pictures_) {
+        pictures_->PutIntoPlace();
+    }
     output_->Finish();
+    if (pictures_) {
+        pictures_->RemoveOthers();
+    }
     if (!host::system::IsStandardOutput(options_.movies.together)) {
         fmt::print("{}: {}, {:.1f} MB\n", host::DisplayPath(options_.movies.together),
                    Counted(count, "clip"), static_cast<double>(written_) / 1e6);
@@ -285,11 +261,9 @@ void ReportRun::Finish(int read, int) {
     } else if (IsStopped() && takesPlace_) {
         TellAlso(Failure(kExitFile, file, "left as it was: not all movies were read"));
     } else {
-        if (!folder_.empty()) {
-            RemoveOldPictures();
-        }
         WritePage();
     }
+    pictures_.reset();  // a signal that was held back ends the program soon
     TellUnusedMaps(read);
 }
 

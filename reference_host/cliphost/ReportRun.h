@@ -11,8 +11,8 @@
 #include "reference_host/cliphost/MovieCodecs.h"
 #include "reference_host/cliphost/MoviesRun.h"
 #include "reference_host/cliphost/OutputFile.h"
-#include "reference_host/cliphost/OutputFolder.h"
 #include "reference_host/cliphost/PathMaps.h"
+#include "reference_host/cliphost/ReportFolder.h"
 #include "reference_host/report/Page.h"
 
 namespace cliphost {
@@ -57,8 +57,8 @@ private:
     std::optional<catalog::Entry> EntryInCatalogs(const std::filesystem::path& movie);
     void AddFile(const std::filesystem::path& movie, Json& facts);
     void Add(const std::filesystem::path& movie, Json clip, bool hasFailed);
-    void PutBeside(Json& picture, const char* name);
-    void RemoveOldPictures() const;
+    // Into the folder beside the page, where there is one.
+    void TakePictures(Json& facts, Json& details);
     void WritePage();
     void TellUnusedMaps(int read);
 
@@ -66,8 +66,7 @@ private:
     PathMaps maps_;  // to know which were used
     CodecReader codecs_;
     bool takesPlace_ = false;
-    std::filesystem::path folder_;  // of pictures; empty: they are in the page
-    std::optional<OutputFolder> madeFolder_;
+    std::optional<ReportFolder> pictures_;  // none: they are in the page
     std::optional<OutputFile> output_;
     std::optional<report::Page> page_;
     std::uint64_t written_ = 0;

@@ -324,9 +324,22 @@ TEST_F(Reports, PutPicturesIntoAFolderBesideThePage) {
     const std::string page = TextOfFile(folder() / "my report.html");
     EXPECT_EQ(page.find("\"data\":\""), std::string::npos);
     EXPECT_NE(page.find("my%20report_files/00000-poster.webp"), std::string::npos);
-    // What an earlier page had more goes.
-    ExpectSays(Run("in/a.mov -o 'my report.html' --split"), 0, "1 clip");
-    EXPECT_EQ(FilesIn("my report_files").size(), 2u);
+}
+
+TEST_F(Reports, RemoveThePicturesOfAnEarlierPageAndNoOtherFile) {
+    Copy("h264_with_aac.mov", "in/a.mov");
+    Copy("pcm_u8.mov", "in/b.mov");  // has none
+    Copy("rotated_270.mov", "in/c.mov");
+    ExpectSays(Run("in -o r.html --split"), 0, "3 clips");
+    const std::set<std::string> both = {"00000-poster.webp", "00000-strip.webp",
+                                        "00002-poster.webp", "00002-strip.webp"};
+    EXPECT_EQ(FilesIn("r_files"), both);
+    const std::set<std::string> others = {"00009-poster.txt", "notes.webp", "9-strip.webp"};
+    for (const std::string& other : others) {
+        std::ofstream(folder() / "r_files" / other) << "mine";
+    }
+    ExpectSays(Run("in/b.mov -o r.html --split"), 0, "1 clip");
+    EXPECT_EQ(FilesIn("r_files"), others);
 }
 
 TEST_F(Reports, GoToStandardOutputWhole) {
