@@ -87,9 +87,10 @@ void TakeCatalogs(ReportOptions& options) {
                             : options.title;
         options.catalogs.push_back({path, OpenCatalog(path, catalog::Catalog::For::Reading)});
         WithCatalog(path, [&] {
-            catalog::Statement select = options.catalogs.back().catalog.database().Prepare(
-                "SELECT path FROM movies ORDER BY path");
-            while (select.Step()) {
+            ReportOptions::NamedCatalog& named = options.catalogs.back();
+            catalog::Statement select =
+                named.catalog.database().Prepare("SELECT path FROM movies ORDER BY path");
+            for (; select.Step(); ++named.movies) {
                 paths.push_back(PathOfMachinePath(select.Text(0)));
             }
         });
@@ -122,7 +123,7 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
 }
 
 // The page takes its place when all was read, so nothing that is read may lie there.
-void ReportRun::Planned(const MoviePlan&) {
+void ReportRun::Planned(const MoviePlan& plan) {
     const std::filesystem::path& page = options_.movies.together;
     std::vector<CallFile> read = {{"the list of movies", options_.movies.list}};
     for (const ReportOptions::NamedCatalog& one : options_.catalogs) {
@@ -130,6 +131,25 @@ void ReportRun::Planned(const MoviePlan&) {
     }
     RefuseOutputOnto(page, read);
     RefuseOntoMovie(page);
+    for (const ReportOptions::NamedCatalog& one : options_.catalogs) {
+        if (one.movies == 0) {
+            TellAlso(Failure(kExitFile, one.file, "the catalog holds no movie",
+                             "`cliphost catalog FOLDER -o FILE` puts movies into one"));
+        }
+    }
+    RefuseCatalogsOfList(plan);
+}
+
+// No movie begins as they do; without a list those of the call were taken already.
+void ReportRun::RefuseCatalogsOfList(const MoviePlan& plan) {
+    for (std::size_t i = 0; !options_.movies.list.empty() && i < plan.size(); ++i) {
+        const MovieStep step = plan[i];
+        if (step.IsMovie() && IsDatabase(step.movie)) {
+            RefuseMovie(i, Failure(kExitCaller, step.movie,
+                                   "this is a database, such as a catalog, and no movie",
+                                   "name a catalog on the command line, not in a list"));
+        }
+    }
 }
 
 MovieAnswer ReportRun::Answer(const MovieStep& step, const PlaceOfFile&) {

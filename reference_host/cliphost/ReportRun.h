@@ -26,6 +26,7 @@ struct ReportOptions {
     struct NamedCatalog {
         std::filesystem::path file;
         catalog::Catalog catalog;
+        std::size_t movies = 0;
     };
     // Those of the command line; what they know of movies that can't be read is told.
     std::vector<NamedCatalog> catalogs;
@@ -54,6 +55,7 @@ private:
     bool LooksFirst() const override { return true; }
     void Finish(int read, int failed) override;
 
+    void RefuseCatalogsOfList(const MoviePlan& plan);
     std::optional<catalog::Entry> EntryInCatalogs(const std::filesystem::path& movie);
     void AddFile(const std::filesystem::path& movie, Json& facts);
     void Add(const std::filesystem::path& movie, Json clip, bool hasFailed);

@@ -49,6 +49,12 @@ protected:
         const Json report = Report(Quoted(movie) + " " + options);
         return report["clips"].size() == 1 ? report["clips"][0] : Json::object();
     }
+    void MakeCatalog(const std::string& of, const std::string& options = "") {
+        const CommandResult made =
+            RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
+                       " catalog " + of + " -o c.sqlite " + options + " 2>&1");
+        ASSERT_TRUE(std::filesystem::exists(folder() / "c.sqlite")) << made.out;
+    }
     std::set<std::string> FilesIn(const std::string& name) {
         std::set<std::string> files;
         for (const auto& entry : std::filesystem::directory_iterator(folder() / name)) {
@@ -258,10 +264,7 @@ TEST_F(Reports, HoldMoviesThatCanNotBeDescribedWithTheReason) {
 TEST_F(Reports, ShowWhatACatalogKnowsOfMoviesThatAreGone) {
     Copy("h264_with_aac.mov", "in/a.mov");
     Copy("pcm_u8.mov", "in/b.mov");
-    ASSERT_EQ(RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
-                         " catalog in -o c.sqlite --thumbnails")
-                  .status,
-              0);
+    MakeCatalog("in", "--thumbnails");
     std::filesystem::remove(folder() / "in/a.mov");
     const Json report = Report("c.sqlite");
     EXPECT_EQ(status, 2);
@@ -281,6 +284,32 @@ TEST_F(Reports, RefuseADatabaseThatIsNoCatalog) {
         << std::string("SQLite format 3\0", 16) << std::string(84, '\0');
     ExpectSays(Run("x.sqlite -o r.html"), 2, "x.sqlite: ");
     EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+}
+
+TEST_F(Reports, TellThatACatalogHoldsNoMovie) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    std::filesystem::create_directory(folder() / "empty");
+    MakeCatalog("empty");
+    const CommandResult alone = Run("c.sqlite -o r.html");
+    ExpectSays(alone, 1, "c.sqlite: the catalog holds no movie; `cliphost catalog");
+    ExpectSays(alone, 1, "r.html: not written: there is no movie to show");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+    const CommandResult beside = Run("c.sqlite in/a.mov -o r.html");
+    ExpectSays(beside, 1, "c.sqlite: the catalog holds no movie");
+    ExpectSays(beside, 1, "r.html: 1 clip,");
+}
+
+TEST_F(Reports, TakeNoCatalogOutOfAList) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    MakeCatalog("in");
+    std::ofstream(folder() / "l.txt") << "in/a.mov\nc.sqlite\n";
+    const Json report = Report("--files-from l.txt");
+    EXPECT_EQ(status, 2);
+    ASSERT_EQ(report["clips"].size(), 2u);
+    EXPECT_EQ(report["clips"][0]["failed"], false);
+    EXPECT_EQ(report["clips"][1]["failed"], true);
+    EXPECT_EQ(report["clips"][1]["warnings"][0].value("hint", ""),
+              "name a catalog on the command line, not in a list");
 }
 
 TEST_F(Reports, TellPlacesAsAnotherMachineSeesThem) {
@@ -386,10 +415,7 @@ TEST_F(Reports, TakeThePlaceOfNoMovieThatIsRead) {
 TEST_F(Reports, TakeThePlaceOfNoListOrCatalogThatIsRead) {
     Copy("pcm_u8.mov", "in/a.mov");
     std::ofstream(folder() / "l.txt") << "in/a.mov\n";
-    ASSERT_EQ(RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
-                         " catalog in -o c.sqlite")
-                  .status,
-              0);
+    MakeCatalog("in");
     const std::string catalog = TextOfFile(folder() / "c.sqlite");
     ExpectSays(Run("c.sqlite -o c.sqlite"), 2,
                "c.sqlite: this is a catalog that the page is made from");
