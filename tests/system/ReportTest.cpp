@@ -5,6 +5,7 @@
 
 #include <cmath>
 #include <fstream>
+#include <functional>
 #include <nlohmann/json.hpp>
 #include <set>
 #include <sstream>
@@ -236,6 +237,145 @@ TEST_F(Reports, TellWhatIsOddTogether) {
     for (const char* const id : {"copies", "rates", "drop"}) {
         EXPECT_EQ(ids.count(id), 1u) << id;
     }
+}
+
+// A movie that is odd in nothing: two seconds of pictures, sound and timecode.
+movies::Movie PlainMovie(std::uint32_t timeScale = 25, std::uint32_t frameDuration = 1,
+                         unsigned flags = movies::kTimecode24Hours) {
+    const std::uint32_t frames = 2 * timeScale / frameDuration;
+    movies::VideoFormat picture;
+    picture.codec = "apcn";
+    picture.fields = {1u, 0u};
+    picture.nclc = {1u, 1u, 1u};
+    movies::TimecodeFormat timecode;
+    timecode.timeScale = timeScale;
+    timecode.frameDuration = frameDuration;
+    timecode.numFrames = (timeScale + frameDuration - 1) / frameDuration;
+    timecode.flags = flags;
+    movies::Movie movie;
+    movie.tracks = {movies::VideoTrack(picture, frames, timeScale, frameDuration, 64),
+                    movies::SoundTrack(movies::SoundFormat(), 96000),
+                    movies::TimecodeTrack(timecode, 90000, frames)};
+    movie.tracks[1].fill = 1;  // so that it is heard
+    return movie;
+}
+
+movies::Movie With(const std::function<void(movies::VideoFormat& format)>& change) {
+    movies::Movie movie = PlainMovie();
+    movies::VideoFormat format;
+    format.codec = "apcn";
+    format.fields = {1u, 0u};
+    format.nclc = {1u, 1u, 1u};
+    change(format);
+    movie.tracks[0].descriptions = {format.ToBox()};
+    return movie;
+}
+
+movies::Movie With(const std::function<void(movies::Movie& movie)>& change) {
+    movies::Movie movie = PlainMovie();
+    change(movie);
+    return movie;
+}
+
+movies::Movie WithEdits(std::vector<movies::Edit> edits) {
+    return With([&](movies::Movie& movie) { movie.tracks[0].edits = std::move(edits); });
+}
+
+struct OddMovie {
+    const char* trait;  // what is odd about it; empty: nothing
+    const char* words;
+    movies::Movie movie;
+};
+
+std::vector<OddMovie> OddMovies() {
+    const auto first = [](movies::Movie& movie) -> movies::Track& { return movie.tracks[0]; };
+    return {
+        {"", "", PlainMovie()},
+        {"variableRate", "pictures last from 40 to 120 ms", With([&](movies::Movie& movie) {
+             first(movie).samples = {{20, 64, 1}, {10, 64, 3}};
+         })},
+        // Such as a rate that the time scale does not divide.
+        {"", "", With([&](movies::Movie& movie) {
+             first(movie).mediaTimeScale = 2500;
+             first(movie).samples = {{20, 64, 100}, {30, 64, 101}};
+         })},
+        {"pixelAspect", "pixels are 16:15", With([](movies::VideoFormat& format) {
+             format.pixelAspect = {16, 15};
+         })},
+        {"", "", With([](movies::VideoFormat& format) {
+             format.pixelAspect = {1, 1};
+         })},
+        {"provider", "video: The FOURCC video code of xyz1 is not natively supported.",
+         With([](movies::VideoFormat& format) { format.codec = "xyz1"; })},
+        {"rotated", "rotated by 90 degrees",
+         With([&](movies::Movie& movie) { first(movie).matrix = movies::kRotated90; })},
+        {"rotated", "rotated by 180 degrees",
+         With([&](movies::Movie& movie) { first(movie).matrix = movies::kRotated180; })},
+        {"rotated", "rotated by 270 degrees",
+         With([&](movies::Movie& movie) { first(movie).matrix = movies::kRotated270; })},
+        {"noTimecode", "no timecode track",
+         With([](movies::Movie& movie) { movie.tracks.pop_back(); })},
+        {"noSound", "no sound track",
+         With([](movies::Movie& movie) { movie.tracks.erase(movie.tracks.begin() + 1); })},
+        {"silent", "all of its sound is silence",
+         With([](movies::Movie& movie) { movie.tracks[1].fill = 0; })},
+        {"edits", "picture: the first 0.2 s of the media are left out",
+         WithEdits({{1080, 5, 1.0}})},
+        {"edits", "picture: begins with a pause", WithEdits({{120, -1, 1.0}, {1200, 0, 1.0}})},
+        {"edits", "picture: several edits, or another speed",
+         WithEdits({{600, 0, 1.0}, {300, 30, 1.0}})},
+        {"edits", "picture: several edits, or another speed", WithEdits({{600, 0, 2.0}})},
+        {"", "", WithEdits({{1200, 0, 1.0}})},
+    };
+}
+
+TEST_F(Reports, TellWhatIsOddAboutAMovieAndNothingElse) {
+    std::filesystem::create_directory(folder() / "in");
+    const std::vector<OddMovie> movies = OddMovies();
+    for (std::size_t i = 0; i < movies.size(); ++i) {
+        Write(movies[i].movie, "in/" + std::to_string(100 + i) + ".mov");
+    }
+    const Json clips = Report("in")["clips"];
+    ASSERT_EQ(clips.size(), movies.size());
+    for (std::size_t i = 0; i < movies.size(); ++i) {
+        SCOPED_TRACE(std::to_string(i) + " " + movies[i].words);
+        std::set<std::string> wanted;
+        if (*movies[i].trait != '\0') {
+            wanted.insert(movies[i].trait);
+        }
+        EXPECT_EQ(TraitsOf(clips[i]), wanted);
+        EXPECT_EQ(WordsOf(clips[i], movies[i].trait), movies[i].words);
+    }
+}
+
+// "colors: Rec. 2020, HLG (9-18-9) 1, Rec. 709 (1-1-1) 0" of a finding.
+std::string Groups(const Json& report, const std::string& finding) {
+    std::string text;
+    for (const Json& one : report["odd"]) {
+        for (const Json& group : one["id"] == finding ? one["groups"] : Json::array()) {
+            text += (text.empty() ? "" : ", ") + group["label"].get<std::string>();
+            for (const Json& clip : group["clips"]) {
+                text += " " + std::to_string(clip.get<int>());
+            }
+        }
+    }
+    return text;
+}
+
+TEST_F(Reports, TellWhatMoviesMix) {
+    std::filesystem::create_directory(folder() / "in");
+    Write(PlainMovie(), "in/0.mov");
+    Write(PlainMovie(), "in/1.mov");
+    Write(With([](movies::VideoFormat& format) { format.nclc = {9u, 18u, 9u}; }), "in/2.mov");
+    Write(With([](movies::VideoFormat& format) { format.nclc.reset(); }), "in/3.mov");
+    Write(PlainMovie(30000, 1001), "in/4.mov");
+    Write(PlainMovie(30000, 1001, movies::kTimecode24Hours | movies::kTimecodeDrop), "in/5.mov");
+    const Json report = Report("in");
+    EXPECT_EQ(Groups(report, "colors"),
+              "Rec. 2020, HLG (9-18-9) 2, Rec. 709 (1-1-1) 0 1 4 5, not told 3");
+    EXPECT_EQ(Groups(report, "drop"), "drop-frame 5, non-drop 4");
+    EXPECT_EQ(Groups(report, "rates"), "25/1 0 1 2 3, 30000/1001 4 5");
+    EXPECT_EQ(Groups(report, "copies"), report["clips"][0]["id"].get<std::string>() + " 0 1");
 }
 
 TEST_F(Reports, CallNoMovieACopyOfItself) {
