@@ -186,6 +186,38 @@ TEST_F(Reports, TellSilence) {
     EXPECT_EQ(TraitsOf(ClipOf(MadeMovie("h264_with_aac.mov"))).count("silent"), 0u);
 }
 
+// Sound of half an hour and a bit, which is silent but for a moment. Its bytes are holes, mostly.
+movies::Movie LongSound(std::uint64_t loudSample) {
+    constexpr std::uint64_t kSamples = 96'000'000;  // 240 columns of 400,000
+    movies::SoundFormat format;
+    format.channels = 1;
+    movies::Movie movie;
+    movie.tracks = {movies::SoundTrack(format, kSamples)};
+    movie.largeMedia = true;
+    movies::Track& track = movie.tracks[0];
+    track.data.assign(static_cast<std::size_t>(loudSample + 1) * 2, 0);
+    track.data.back() = 0x40;
+    return movie;
+}
+
+TEST_F(Reports, LookAtLongSoundInPieces) {
+    const Json wave = ClipOf(Write(LongSound(16'383), "piece.mov"))["details"]["waves"][0];
+    EXPECT_EQ(wave["isWhole"], false);
+    EXPECT_EQ(wave["lacksSamples"], false);
+    EXPECT_NEAR(wave["seconds"].get<double>(), 2000, 1);
+    ASSERT_EQ(wave["peaks"].size(), 240u);
+    EXPECT_EQ(wave["peaks"][0], std::lround(255 * std::sqrt(0.5)));
+    EXPECT_EQ(wave["peaks"][1], 0);
+}
+
+TEST_F(Reports, CallNoSoundSilentThatWasLookedAtInPieces) {
+    const Json clip = ClipOf(Write(LongSound(16'384), "between.mov"));
+    const Json& wave = clip["details"]["waves"][0];
+    EXPECT_EQ(wave["isWhole"], false);
+    EXPECT_FALSE(wave.contains("highest"));
+    EXPECT_EQ(TraitsOf(clip).count("silent"), 0u);
+}
+
 TEST_F(Reports, CallNoSoundSilenceThatWasNotLookedAt) {
     const std::string silence = "-f lavfi -t 0.2 -i anullsrc=r=48000:cl=mono ";
     const std::string sine = "-f lavfi -i sine=sample_rate=48000:duration=0.2 ";
