@@ -13,6 +13,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/ReportClip.h"
 #include "reference_host/cliphost/ReportOdd.h"
@@ -73,6 +74,16 @@ std::string TitleOf(const ReportOptions& options) {
 }
 
 }  // namespace
+
+std::string AdviceOnSize(std::uint64_t bytes, bool isSplit) {
+    constexpr std::uint64_t kMostBytes = 60'000'000;
+    return isSplit || bytes <= kMostBytes
+               ? std::string()
+               : fmt::format(
+                     "it has {:.0f} MB; --split makes a smaller one, with the pictures in a folder "
+                     "beside it",
+                     static_cast<double>(bytes) / 1e6);
+}
 
 void TakeCatalogs(ReportOptions& options) {
     std::vector<std::filesystem::path> paths;
@@ -262,6 +273,9 @@ void ReportRun::WritePage() {
     if (!host::system::IsStandardOutput(options_.movies.together)) {
         fmt::print("{}: {}, {:.1f} MB\n", host::DisplayPath(options_.movies.together),
                    Counted(count, "clip"), static_cast<double>(written_) / 1e6);
+    }
+    if (const std::string advice = AdviceOnSize(written_, options_.isSplit); !advice.empty()) {
+        Notice("cliphost: {}: {}\n", host::DisplayPath(options_.movies.together), advice);
     }
 }
 

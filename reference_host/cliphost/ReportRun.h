@@ -5,6 +5,7 @@
 #include <map>
 #include <nlohmann/json.hpp>
 #include <optional>
+#include <string>
 #include <vector>
 
 #include "reference_host/catalog/Catalog.h"
@@ -34,6 +35,10 @@ struct ReportOptions {
 
 // Takes the catalogs out of the paths and puts their movies there. Throws a Failure.
 void TakeCatalogs(ReportOptions& options);
+
+// What is told of a page with its pictures in it that is larger than those of 1,000 clips are, and
+// what helps; empty for any other.
+std::string AdviceOnSize(std::uint64_t bytes, bool isSplit);
 
 // Writes a page of all movies of the command line, those that can't be described too. It is put
 // into its place at the end; where a signal stops the run, with the movies so far, unless there is

@@ -527,6 +527,22 @@ TEST_F(Reports, PutPicturesIntoAFolderBesideThePage) {
     EXPECT_NE(page.find("my%20report_files/00000-poster.webp"), std::string::npos);
 }
 
+// As a page of 1,000 clips has to stay below 60 MB.
+TEST_F(Reports, TakeNoMoreThanSixtyThousandBytesForAClip) {
+    std::filesystem::create_directory(folder() / "in");
+    Make(
+        "-f lavfi -i 'nullsrc=size=640x360:rate=25:duration=1,geq=random(1)*255:random(2)*255:"
+        "random(3)*255' -f lavfi -i anoisesrc=duration=1:sample_rate=48000 -c:v mjpeg -q:v 2 "
+        "-c:a pcm_s16le",
+        "in/a.mov");
+    ExpectSays(Run("in -o one.html"), 0, "1 clip");
+    std::filesystem::copy_file(folder() / "in/a.mov", folder() / "in/b.mov");
+    ExpectSays(Run("in -o two.html"), 0, "2 clips");
+    const auto size = [&](const char* page) { return std::filesystem::file_size(folder() / page); };
+    EXPECT_GT(size("two.html") - size("one.html"), 20'000u);
+    EXPECT_LE(size("two.html") - size("one.html"), 60'000u);
+}
+
 TEST_F(Reports, RemoveThePicturesOfAnEarlierPageAndNoOtherFile) {
     Copy("h264_with_aac.mov", "in/a.mov");
     Copy("pcm_u8.mov", "in/b.mov");  // has none
