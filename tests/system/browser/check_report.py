@@ -262,6 +262,13 @@ class ReportInBrowser(unittest.TestCase):
                   ".then(() => done(document.images.length), (error) => done(String(error)))")
         self.assertEqual(self.page.wait(loaded), 10)
 
+    def test_leaves_no_files_of_the_browser(self):
+        page = browser.start()
+        folder = Path(page.temporary.name)
+        self.assertNotEqual(list(folder.iterdir()), [])
+        page.quit()
+        self.assertFalse(folder.exists())
+
     def test_is_accessible_by_axe(self):
         if not self.axe:
             self.skipTest(self.no_axe)
