@@ -108,6 +108,10 @@ class ReportInBrowser(unittest.TestCase):
         self.assertTrue(self.page.one(".nothing").is_displayed())
         self.page.click(".nothing button")
         self.assertEqual(len(self.names()), self.count)
+        search.send_keys("undefined")  # of clips without pictures
+        self.page.frame()
+        self.assertEqual(self.names(), [])
+        search.clear()
         search.send_keys("PRORES 1080")
         self.page.frame()
         self.assertEqual(self.names(), ["prores_hq_1080i"])
