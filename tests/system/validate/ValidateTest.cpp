@@ -462,10 +462,20 @@ TEST_F(Validates, AndBlamesNoModuleForFilesThatItCannotWriteItself) {
             "ulimit -f 2; " + Quoted(ProgramFolder() / "cliphost") + " validate " +
             Quoted(Faulty("FaultyModule")) +
             " --only files-broken --only volume-info --only container-path-once" + given);
-        ExpectSays(ran, 0, "3 checks: 0 passed, 0 failed, 0 crashed, 0 timed out, 0 warning, 3");
-        ExpectSays(ran, 0, "because   the checker can't write ");
-        ExpectSays(ran, 0, "whole.mov: File too large; name another folder in TMPDIR\n");
+        ExpectSays(ran, 2, "3 checks: 0 passed, 0 failed, 0 crashed, 0 timed out, 0 warning, 3");
+        ExpectSays(ran, 2, "because   the checker can't write ");
+        ExpectSays(ran, 2, "whole.mov: File too large; name another folder in TMPDIR\n");
     }
+}
+
+TEST_F(Validates, AndPassesNothingWhereAllIsSkipped) {
+    const std::string call = "validate " + Quoted(kMinimal) + " --only volume-info";
+    for (const char* const given : {"", " --in-process", " --json"}) {
+        SCOPED_TRACE(given);
+        ExpectSays(RunCliphost(call + given), 2,
+                   "MinimalModule.nvx: nothing was checked: all checks were skipped, and say why");
+    }
+    ExpectSays(RunCliphost(call + " --only plugin-id"), 0, "2 checks: 1 passed");
 }
 
 TEST_F(Validates, AndTellsWhenItsAnswerCannotBeWritten) {
