@@ -362,8 +362,13 @@ TEST_F(Validates, AndACrashCostsOneCheckAlone) {
 }
 
 TEST_F(Validates, AndABadEndAfterAPassIsACrash) {
-    for (const auto& [fault, found] : {std::pair("end-crashes", "ended by signal 11"),
-                                       std::pair("end-has-status", "ended with status 3")}) {
+    const struct {
+        const char* fault;
+        const char* found;
+        const char* cause;
+    } rows[] = {{"end-crashes", "ended by signal 11", "a pointer is used that is null"},
+                {"end-has-status", "ended with status 3", "ends the whole process (exit)"}};
+    for (const auto& [fault, found, cause] : rows) {
         setenv("CLIPHOST_FAULT", fault, 1);
         const Answer answer = Validate(Faulty("FaultyModule"), "--only plugin-names");
         EXPECT_EQ(answer.status, 1);
@@ -371,7 +376,19 @@ TEST_F(Validates, AndABadEndAfterAPassIsACrash) {
         EXPECT_EQ(check["verdict"], "crashed");
         EXPECT_EQ(check["done"], "ending the process after the check");
         EXPECT_NE(check.value("found", "").find(found), std::string::npos) << check.dump(2);
+        EXPECT_NE(check.value("cause", "").find(cause), std::string::npos) << check.dump(2);
+        EXPECT_NE(check.value("cause", "").find("a global object's destructor"), std::string::npos);
     }
+}
+
+TEST_F(Validates, AndTellsWhatACrashIsDueToBeforeWhatTheCheckLooksFor) {
+    setenv("CLIPHOST_FAULT", "order-shutdown-twice", 1);
+    const std::string cause = Validate(Faulty("FaultyModule"), "--only order-shutdown-twice")
+                                  .Of("order-shutdown-twice")
+                                  .value("cause", "");
+    EXPECT_EQ(cause,
+              "a pointer is used that is null, or that leads to something that is gone; behind it "
+              "may be what this check looks for: what was released is released again");
 }
 
 TEST_F(Validates, AndABadEndDoesNotHideAFault) {
