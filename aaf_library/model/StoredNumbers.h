@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstring>
+
 #include "aaf_library/model/PropertyValue.h"
 
 namespace aaf {

@@ -86,7 +86,8 @@ FileResult ReplaceFile(const std::vector<Bytes>& pieces, const std::filesystem::
         return SystemFailure(path, "cannot be written");
     }
     if (const std::error_code problem = temporary.MoveTo(path)) {
-        return Failed(FileFailure::NoAccess, path, "cannot be replaced: " + problem.message());
+        return Failed(FileFailure::NoAccess, path,
+                      "cannot be replaced: " + problem.default_error_condition().message());
     }
     return {};
 }

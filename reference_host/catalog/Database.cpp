@@ -72,7 +72,7 @@ void Database::Closing::operator()(sqlite3* handle) const {
 
 Database::Database(const std::filesystem::path& file, Access access) : file_(file) {
     // A name of another form could mean something else than a file.
-    Open(std::filesystem::absolute(file).c_str(), FlagsOf(access));
+    Open(std::filesystem::absolute(file).u8string().c_str(), FlagsOf(access));
     if (access == Access::Read) {
         Run("PRAGMA query_only = ON");
     }

@@ -81,7 +81,7 @@ void CopyForEdit(const std::filesystem::path& source, OutputFile& output) {
                                      std::filesystem::perm_options::add, error);
     }
     if (error) {
-        output.Fail(error.value());
+        output.Fail(error.default_error_condition().value());
     }
 }
 
@@ -149,7 +149,7 @@ void AafLibrary::WriteToDevice(const std::filesystem::path& device, const Write&
     const host::system::ScratchFolder scratch(error);
     if (error) {
         throw Failure(kExitCaller, host::system::TemporaryFolder(),
-                      "no folder can be made there: " + error.message(),
+                      "no folder can be made there: " + error.default_error_condition().message(),
                       "name another one in TMPDIR");
     }
     const std::filesystem::path clip = scratch.path() / "clip.aaf";

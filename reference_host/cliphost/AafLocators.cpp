@@ -6,6 +6,7 @@
 #include "host_interfaces/aaf/AAFDictionary.h"
 #include "reference_host/cliphost/AafQuery.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/system/Paths.h"
 #include "text/Encodings.h"
 
 namespace cliphost {
@@ -79,17 +80,20 @@ void AppendLocator(IAAFFile* file, IAAFEssenceDescriptor& descriptor, const std:
     if (file->GetDictionary(dictionary.Out()) < 0 ||
         dictionary->CreateInstance(AUID_AAFNetworkLocator, IID_IAAFLocator,
                                    reinterpret_cast<IUnknown**>(added.Out())) < 0) {
-        throw Failure(kExitFile, url, "the AAF library makes no locator for it");
+        throw Failure(kExitFile, host::system::PathOfText(url),
+                      "the AAF library makes no locator for it");
     }
     SetPath(*added, url);
     if (descriptor.AppendLocator(added.get()) < 0) {
-        throw Failure(kExitFile, url, "the AAF library does not take a locator for it");
+        throw Failure(kExitFile, host::system::PathOfText(url),
+                      "the AAF library does not take a locator for it");
     }
 }
 
 void SetPath(IAAFLocator& locator, const std::string& url) {
     if (locator.SetPath(encodings::ToWideLossy(encodings::FromUtf8(url)).c_str()) < 0) {
-        throw Failure(kExitFile, url, "the AAF library does not take this as a locator's path");
+        throw Failure(kExitFile, host::system::PathOfText(url),
+                      "the AAF library does not take this as a locator's path");
     }
 }
 

@@ -44,7 +44,7 @@ private:
     std::chrono::milliseconds rest_;
     StateOf stateOf_;
     std::map<std::filesystem::path, OnItsWay> onTheirWay_;
-    std::unordered_map<std::string, host::system::FileState> arrived_;
+    std::unordered_map<std::filesystem::path::string_type, host::system::FileState> arrived_;
 };
 
 }  // namespace cliphost

@@ -6,6 +6,7 @@
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/SoundReader.h"
 #include "reference_host/cliphost/Verbs.h"
@@ -169,7 +170,7 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost audio clip.mov -o - | flac -o sound.flac -\n\n"
         "A file of more than 4 GiB is written as RF64, which WAV programs read.");
     auto options = std::make_shared<AudioOptions>();
-    verb->add_option("movie", options->movie, "The movie")->required();
+    AddPath(*verb, "movie", options->movie, "The movie")->required();
     verb->add_option("--track", options->track,
                      "Number of the track; without it, the first sound track")
         ->check(SmallWholeNumber());
@@ -181,7 +182,7 @@ void AddAudio(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_option("--rate", options->rate,
                      "Samples a second, for a movie that can't be described")
         ->check(SmallWholeNumber(1));
-    verb->add_option("-o,--output", options->output, "The WAV file, or - for standard output")
+    AddPath(*verb, "-o,--output", options->output, "The WAV file, or - for standard output")
         ->required();
     verb->callback([&session, &status, options] {
         Session running(session);

@@ -16,6 +16,7 @@
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 #include "text/Encodings.h"
 
 namespace cliphost {
@@ -34,7 +35,7 @@ std::string NumberOfMovie(const std::string& path) {
 
 // As descriptions have it: bytes that are no UTF-8 are U+FFFD.
 std::string NameOfClip(const std::filesystem::path& movie) {
-    std::u32string name = encodings::FromUtf8(movie.stem().native());
+    std::u32string name = encodings::FromUtf8(host::system::PathText(movie.stem()));
     std::replace_if(name.begin(), name.end(), encodings::IsSurrogate, U'\uFFFD');
     return encodings::ToUtf8Lossy(name);
 }

@@ -5,6 +5,7 @@
 #include "reference_host/cliphost/ColumnsOption.h"
 #include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
@@ -53,7 +54,7 @@ void AddCatalog(CLI::App& app, const SessionOptions& session, int& status) {
         "in the\ncatalog too, with the reason.");
     auto options = std::make_shared<CatalogOptions>();
     auto isMerge = std::make_shared<bool>(false);
-    verb->add_option("-o,--output", options->movies.together, "The catalog")->required();
+    AddPath(*verb, "-o,--output", options->movies.together, "The catalog")->required();
     auto* const update =
         verb->add_flag("--update", options->update,
                        "Read only movies that are new or have changed, or that failed before; "

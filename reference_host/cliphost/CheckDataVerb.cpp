@@ -6,6 +6,7 @@
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/data_check/DataCheck.h"
@@ -125,9 +126,9 @@ void AddCheckData(CLI::App& app, const SessionOptions& session, int& status) {
         "Exit status: 0, nothing was found; 1, the files have mistakes; 2, the folder or a file "
         "can't be read.");
     auto options = std::make_shared<CheckDataOptions>();
-    verb->add_option("folder", options->folder,
-                     "The folder of FourCharMapper.xml and AAFInfo.xml; the module's own without "
-                     "it");
+    AddPath(*verb, "folder", options->folder,
+            "The folder of FourCharMapper.xml and AAFInfo.xml; the module's own without "
+            "it");
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {
         const std::filesystem::path folder =

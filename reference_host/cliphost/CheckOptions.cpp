@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/CheckOptions.h"
 
 #include "reference_host/cliphost/MapOption.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 
 namespace cliphost {
@@ -12,10 +13,10 @@ CLI::Option* AddCheckOptions(CLI::App& verb, CheckOptions& options) {
                  "FROM=TO, as `cliphost describe` takes it: what the file names in TO is in the "
                  "folder FROM of this machine; may be given several times");
     auto* const search =
-        verb.add_option("--search", options.search,
-                        "A folder in which, and in the folders in it, movies are looked for that "
-                        "are not in their places: by their content, among files with the endings "
-                        "of those; may be given several times")
+        AddPaths(verb, "--search", options.search,
+                 "A folder in which, and in the folders in it, movies are looked for that "
+                 "are not in their places: by their content, among files with the endings "
+                 "of those; may be given several times")
             ->allow_extra_args(false);
     AddWorkerOptions(verb, options.workers);
     return search;

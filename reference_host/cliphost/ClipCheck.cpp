@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/MovieSearch.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -59,12 +60,14 @@ ClipPlace ClipCheck::PlaceOf(const std::string& url) {
         place.reason = Quoted(url);
         return place;
     }
-    if (!named.machine.empty() ||
-        (named.IgnoresCase() && !std::filesystem::exists(named.path, error))) {
+    const std::filesystem::path there = host::system::PathOfPlace(named.machine, named.path);
+    // Where paths have no drives, a drive's name may still be a folder's.
+    const bool isDriveElsewhere = !there.has_root_name() && named.IgnoresCase();
+    if (there.empty() || (isDriveElsewhere && !std::filesystem::exists(there, error))) {
         place.reason = "this is a place of another machine; say with --map where it is here";
         return place;
     }
-    place.path = std::filesystem::path(named.path).lexically_normal();
+    place.path = there.lexically_normal();
     const auto status = std::filesystem::status(place.path, error);
     if (const Problem problem = WhyUnreadable(place.path)) {
         place.state = status.type() == std::filesystem::file_type::not_found ? ClipState::Missing
@@ -147,7 +150,7 @@ void ClipCheck::Search(const std::vector<CheckedClip*>& clips) {
         for (const ClipPlace& place : clip->places) {
             UrlPlace named;
             if (ReadFileUrl(place.url, named)) {
-                endings.insert(SoughtEnding(named.path));
+                endings.insert(SoughtEnding(host::system::PathOfText(named.path)));
             }
         }
     }

@@ -15,6 +15,7 @@
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/HostText.h"
 #include "reference_host/util/text/Number.h"
 
@@ -62,7 +63,7 @@ const host::ParameterInfo& FindParameter(const std::vector<host::ParameterInfo>&
             return info;
         }
     }
-    throw Failure(kExitCaller, "--set " + name,
+    throw Failure(kExitCaller, host::system::PathOfText("--set " + name),
                   "the clip has no such parameter; it has these:" +
                       Listed(infos, [](const auto& info) { return info.name; }));
 }
@@ -86,7 +87,8 @@ ncfUInt32 FindValue(const host::ParameterInfo& info, const std::string& text) {
     if (host::text::ReadNumber(text, number)) {
         return number;
     }
-    throw Failure(kExitCaller, fmt::format("--set {}={}", info.name, text),
+    throw Failure(kExitCaller,
+                  host::system::PathOfText(fmt::format("--set {}={}", info.name, text)),
                   found.empty() ? "there is no such choice" : "several choices begin with this",
                   "write one of these, or a number:" +
                       Listed(info.choices, [](const auto& choice) { return choice.text; }));
@@ -192,8 +194,8 @@ void ClipParameters::Assign(const std::vector<std::string>& assignments) {
     for (const std::string& assignment : assignments) {
         const std::size_t equals = assignment.find('=');
         if (equals == std::string::npos) {
-            throw Failure(kExitCaller, "--set " + assignment, "the value is missing",
-                          "write it as \"name=value\"");
+            throw Failure(kExitCaller, host::system::PathOfText("--set " + assignment),
+                          "the value is missing", "write it as \"name=value\"");
         }
         const host::ParameterInfo& info = FindParameter(infos, assignment.substr(0, equals));
         const ncfUInt32 value = FindValue(info, assignment.substr(equals + 1));

@@ -44,7 +44,9 @@ ClipTrack ReadTrack(IAAFFileDescriptor* descriptor) {
     descriptor->GetSampleRate(&track.rate);
     if (const auto sound = As<IAAFSoundDescriptor>(descriptor)) {
         track.kind = TrackKind::Sound;
-        sound->GetChannelCount(&track.channels);
+        aafUInt32 channels = 0;
+        sound->GetChannelCount(&channels);
+        track.channels = static_cast<ncfUInt32>(channels);
         sound->GetAudioSamplingRate(&track.rate);
     } else if (const auto picture = As<IAAFDigitalImageDescriptor>(descriptor)) {
         picture->GetImageAspectRatio(&track.shape);

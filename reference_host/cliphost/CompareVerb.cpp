@@ -6,6 +6,7 @@
 #include "reference_host/cliphost/ComparisonReport.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 
 namespace cliphost {
@@ -48,8 +49,8 @@ void AddCompare(CLI::App& app, const SessionOptions& session, int& status) {
         "\n\nExit status: 0, the files are alike; 1, they differ, or one can't be read as AAF; 2, "
         "the call is at fault.");
     auto options = std::make_shared<CompareOptions>();
-    verb->add_option("before", options->before, "An AAF file")->required();
-    verb->add_option("after", options->after, "The one that is told against it")->required();
+    AddPath(*verb, "before", options->before, "An AAF file")->required();
+    AddPath(*verb, "after", options->after, "The one that is told against it")->required();
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {
         const ordered_json files = {{"beforeFile", MachinePath(options->before)},

@@ -5,11 +5,13 @@
 #include "reference_host/cliphost/InputOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/SheetRun.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
 #include "reference_host/system/OutputStream.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -65,7 +67,7 @@ void CheckPlaces(const MoviesOptions& movies, bool printsJson) {
         throw Failure(kExitCaller, "--output", "standard output takes the JSON", "name a file");
     }
     RefuseOutputOntoMovie(movies.file, movies.paths[0]);
-    const std::string ending = movies.file.extension().string();
+    const std::string ending = host::system::PathText(movies.file.extension());
     if (!ending.empty() && ending != ".png") {
         throw Failure(kExitCaller, movies.file,
                       fmt::format("a name that ends in '{}' can't be written", ending),
@@ -89,10 +91,10 @@ void AddContact(CLI::App& app, const SessionOptions& session, int& status) {
         "With --use-alpha transparent parts show a checkerboard.");
     auto options = std::make_shared<SheetsOptions>();
     MoviesOptions& movies = options->movies;
-    auto* const output = verb->add_option("-o,--output", movies.file,
-                                          "The PNG file of the only movie, or - for standard "
-                                          "output");
-    verb->add_option("--out-dir", movies.outFolder, "Write every movie's sheet into this folder")
+    auto* const output = AddPath(*verb, "-o,--output", movies.file,
+                                 "The PNG file of the only movie, or - for standard "
+                                 "output");
+    AddPath(*verb, "--out-dir", movies.outFolder, "Write every movie's sheet into this folder")
         ->excludes(output);
     AddSheetForm(*verb, options->form);
     verb->add_flag("--jsonl", options->lines, kMovieLinesHelp);

@@ -20,6 +20,7 @@
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/cliphost/WrittenTable.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -75,7 +76,7 @@ void DescribeRun::RefuseOutputsOntoOthers() const {
     RefuseOutputOnto(table, {{"the file of --aaf", movies.file}, {"the bin", movies.together}});
     // The names of the outputs are found one after the other.
     if (!table.empty() && !movies.outFolder.empty() &&
-        InSmallLetters(table.extension().string()) == kEndingOfOutputs &&
+        InSmallLetters(host::system::PathText(table.extension())) == kEndingOfOutputs &&
         IsPlaceOf(std::filesystem::absolute(table).parent_path(), movies.outFolder)) {
         throw Failure(kExitCaller, table, "a movie's output may have this name",
                       "give the table another ending or folder");
@@ -163,7 +164,8 @@ void DescribeRun::SaveBin() {
         throw Failure(kExitFile, file, "not written: no movie was described");
     }
     if (options_.stringout) {
-        AddStringout(session().aaf(), *bin_, file.stem().string(), options_.editorRate);
+        AddStringout(session().aaf(), *bin_, host::system::PathText(file.stem()),
+                     options_.editorRate);
     }
     bin_->Save(file);
 }

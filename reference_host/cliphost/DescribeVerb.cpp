@@ -9,11 +9,13 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WatchRun.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/cliphost/WorkerVerb.h"
 #include "reference_host/system/OutputStream.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -30,8 +32,8 @@ void AddForm(CLI::App& verb, DescriptionForm& form, std::string& pinned) {
                     "Time stamp of the saved files, such as 2026-01-31T12:00:00Z, so that the "
                     "same movie gives the same bytes");
     AddColumnsOption(verb, form.columns);
-    verb.add_option("--columns-out", form.columnsOut,
-                    "Write such a table of all movies here, with what their descriptions tell");
+    AddPath(verb, "--columns-out", form.columnsOut,
+            "Write such a table of all movies here, with what their descriptions tell");
     AddMapOption(verb, form.maps,
                  "FROM=TO, for another machine that reads what is saved: locators of movies in the "
                  "folder FROM name TO instead, which is a folder, a drive (M:) or a share "
@@ -113,16 +115,14 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         std::string(kLeftOutOfComparison));
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();
-    auto* const aaf =
-        verb->add_option("--aaf", options->movies.file,
-                         "Save the file of the only movie here; - for standard output");
-    verb->add_option("--out-dir", options->movies.outFolder,
-                     "Save every movie's file in this folder")
+    auto* const aaf = AddPath(*verb, "--aaf", options->movies.file,
+                              "Save the file of the only movie here; - for standard output");
+    AddPath(*verb, "--out-dir", options->movies.outFolder, "Save every movie's file in this folder")
         ->excludes(aaf);
     auto* const bin =
-        verb->add_option("--bin", options->movies.together,
-                         "Save one file here with the clips of all movies; copies of a movie are "
-                         "one clip with several places")
+        AddPath(*verb, "--bin", options->movies.together,
+                "Save one file here with the clips of all movies; copies of a movie are "
+                "one clip with several places")
             ->excludes(aaf)
             ->excludes("--out-dir");
     verb->add_flag("--stringout", options->stringout,
@@ -131,9 +131,9 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         ->needs(bin);
     AddForm(*verb, options->form, *pinned);
     auto* const against =
-        verb->add_option("--against", options->against,
-                         "Compare what is described with this AAF file, which an earlier call "
-                         "saved with --aaf or --bin, and tell in words what is other now")
+        AddPath(*verb, "--against", options->against,
+                "Compare what is described with this AAF file, which an earlier call "
+                "saved with --aaf or --bin, and tell in words what is other now")
             ->excludes(aaf)
             ->excludes("--out-dir");
     AddInputOptions(*verb, options->movies, *aaf);
@@ -172,7 +172,8 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
             options->form.columns.Read();
             options->editorRate = session.host.editorFrameRate.value_or(options->editorRate);
             if (app.get_config_ptr()->count() > 0) {
-                options->settingsFile = app.get_config_ptr()->as<std::string>();
+                options->settingsFile =
+                    host::system::PathOfText(app.get_config_ptr()->as<std::string>());
             }
             TakeWorkerVerb(app, *verb, "describe-for-parent", session, options->movies.workers);
             if (!options->against.empty()) {

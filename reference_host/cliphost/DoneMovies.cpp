@@ -15,6 +15,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/Session.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
@@ -76,11 +77,13 @@ std::string SettingsText(const Session& session, const std::vector<std::string>&
         all += '\0' + argument;
         for (const std::string_view option : kFiles) {
             if (StartsWith(argument, option)) {
-                all += '\0' + DigestTextOfFile(argument.substr(option.size()));
+                all += '\0' +
+                       DigestTextOfFile(host::system::PathOfText(argument.substr(option.size())));
             }
         }
         if (StartsWith(argument, kMap) && argument[kMap.size()] != '/') {
-            all += '\0' + std::filesystem::current_path().native();  // FROM may be relative
+            all += '\0' +
+                   host::system::PathText(std::filesystem::current_path());  // FROM may be relative
         }
     }
     return TextOf(DigestOf(all));
@@ -159,8 +162,8 @@ void DoneMovies::LoadLine(const std::string& line) {
 
 bool DoneMovies::Has(const std::filesystem::path& movie, const FileState& state,
                      const std::filesystem::path& output) const {
-    const auto [first, last] =
-        outputs_.equal_range(KeyOf(AbsoluteMachinePath(movie), PercentEncoded(output.native())));
+    const auto [first, last] = outputs_.equal_range(
+        KeyOf(AbsoluteMachinePath(movie), PercentEncoded(host::system::PathText(output))));
     if (first == last) {
         return false;
     }
@@ -189,14 +192,15 @@ std::vector<std::filesystem::path> DoneMovies::OutputsOf(const std::filesystem::
     std::for_each(first, last, [&](const auto& entry) {
         std::string name;
         if (host::text::PercentDecoded(entry.second, name)) {
-            outputs.emplace_back(name);
+            outputs.push_back(host::system::PathOfText(name));
         }
     });
     return outputs;
 }
 
 bool DoneMovies::Keeps(const std::filesystem::path& output) const {
-    return owners_.count(PercentEncoded(output.native())) > 0 && StateOf(outFolder_ / output);
+    return owners_.count(PercentEncoded(host::system::PathText(output))) > 0 &&
+           StateOf(outFolder_ / output);
 }
 
 void DoneMovies::Begin() {
@@ -204,7 +208,7 @@ void DoneMovies::Begin() {
     std::error_code error;
     std::filesystem::create_directory(folder, error);
     if (error) {
-        FailToKeep(FolderNotMade(folder, error.value()));
+        FailToKeep(FolderNotMade(folder, error.default_error_condition().value()));
     }
     std::random_device random;
     written_ = folder / fmt::format("{:08x}{:08x}{}", random(), random(), kEnding);
@@ -226,7 +230,7 @@ void DoneMovies::Add(const std::filesystem::path& movie, const FileState& state,
     ordered_json line = {{"movie", AbsoluteMachinePath(movie)},
                          {"size", state.size},
                          {"date", state.date},
-                         {"output", PercentEncoded(output.native())},
+                         {"output", PercentEncoded(host::system::PathText(output))},
                          {"outputSize", there->size},
                          {"outputDate", there->date}};
     if (known == Known::ByContent) {

@@ -7,6 +7,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/JsonText.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 
 namespace cliphost {
@@ -34,7 +35,7 @@ void AddDump(CLI::App& app, const SessionOptions& options) {
         "  cliphost dump clip.aaf --json");
     auto file = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);
-    verb->add_option("file", *file, "The AAF file")->required();
+    AddPath(*verb, "file", *file, "The AAF file")->required();
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, file, json] {
         AnswerFailureToo(*json, schema::kDump, {{"aaf", MachinePath(*file)}}, [&] {

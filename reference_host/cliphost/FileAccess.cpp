@@ -9,6 +9,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/Access.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -28,7 +29,7 @@ bool IsLink(const std::filesystem::path& path) {
 int ReachError(const std::filesystem::path& path) {
     std::error_code error;
     static_cast<void>(std::filesystem::status(path, error));
-    return error.value();
+    return error.default_error_condition().value();
 }
 
 // The first part of the way, from the root on, that can't be reached.
@@ -93,6 +94,9 @@ const char* KindOf(std::filesystem::file_type type) {
 }  // namespace
 
 Problem WhyUnreachable(const std::filesystem::path& path) {
+    if (const std::string problem = host::system::NameProblem(path); !problem.empty()) {
+        return {path, problem, "give the name that the file has"};
+    }
     const int error = ReachError(path);
     return error == 0 ? Problem() : OutOfReach(path, error);
 }
@@ -133,8 +137,9 @@ Problem WhyUnlistable(const std::filesystem::path& folder) {
     std::error_code error;
     std::filesystem::directory_iterator(folder, error);
     if (error) {
-        return {folder, "the folder can't be listed: " + error.message(),
-                error.value() == EACCES ? "get permission to read it" : ""};
+        return {
+            folder, "the folder can't be listed: " + error.default_error_condition().message(),
+            error.default_error_condition().value() == EACCES ? "get permission to read it" : ""};
     }
     if (const int closed = host::system::AccessError(folder, host::system::Right::Search)) {
         return {folder, "the folder can't be entered: " + SystemText(closed),

@@ -10,9 +10,11 @@
 #include "reference_host/cliphost/CatalogFile.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
@@ -148,7 +150,7 @@ std::string FactsOf(const Statement& row) {
 
 std::string LineOfMovie(const Statement& row, const FindOptions& options) {
     const std::filesystem::path path = PathOfMachinePath(row.Text(kPath));
-    return options.paths ? path.native() + '\0'
+    return options.paths ? host::system::PathText(path) + '\0'
                          : fmt::format("{}: {}\n", host::DisplayPath(path),
                                        host::text::PrintableLines(FactsOf(row)));
 }
@@ -230,7 +232,7 @@ int Find(const FindOptions& options) {
             try {
                 AnswerWith(Fitting(catalog, query), catalog, answer);
             } catch (const catalog::QueryError& error) {
-                throw Failure(kExitCaller, query, error.what());
+                throw Failure(kExitCaller, host::system::PathOfText(query), error.what());
             }
         });
     } catch (const Failure& failure) {
@@ -270,7 +272,7 @@ void AddFind(CLI::App& app, int& status) {
         "\nExit status: 0, movies were found; 1, none was; 2, the call or the catalog is at "
         "fault.");
     auto options = std::make_shared<FindOptions>();
-    verb->add_option("catalog", options->catalog, "The catalog")->required();
+    AddPath(*verb, "catalog", options->catalog, "The catalog")->required();
     verb->add_option("query", options->words, "Words and fields; none: all movies");
     auto* const json = verb->add_flag("--json", options->json, kJsonHelp);
     verb->add_flag("-0,--null", options->paths,

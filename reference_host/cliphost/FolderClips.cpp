@@ -44,13 +44,13 @@ host::Ref<NMA::IMediaVolume> Volume(Session& session) {
 // A name for the movie that the module claims and that is not taken.
 std::filesystem::path ClaimedName(const std::filesystem::path& movie) {
     std::error_code ignored;
-    std::string plain = movie.filename().native();
+    std::string plain = host::system::PathText(movie.filename());
     std::replace(plain.begin(), plain.end(), '\\', '_');
     const std::filesystem::path folder = movie.parent_path();
-    std::filesystem::path name = folder / plain;
+    std::filesystem::path name = folder / host::system::PathOfText(plain);
     name.replace_extension(kClaimedEnding);
     if (std::filesystem::exists(name, ignored)) {
-        name = folder / plain;
+        name = folder / host::system::PathOfText(plain);
         name += kClaimedEnding;
     }
     return name.filename();

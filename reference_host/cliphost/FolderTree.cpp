@@ -9,6 +9,7 @@
 #include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/system/FileNumber.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -64,7 +65,7 @@ private:
 }  // namespace
 
 bool HasEnding(const std::filesystem::path& file, const std::vector<std::string>& endings) {
-    const std::string small = InSmallLetters(file.filename().native());
+    const std::string small = InSmallLetters(host::system::PathText(file.filename()));
     return std::any_of(endings.begin(), endings.end(), [&](const std::string& ending) {
         const std::size_t size = ending.size() + 1;
         return small.size() > size && small[small.size() - size] == '.' &&
@@ -85,7 +86,7 @@ std::vector<std::string> EndingsIn(const std::string& list) {
             ending.erase(0, 1);
         }
         if (ending.empty() || ending.find_first_of("/* ") != std::string::npos) {
-            throw Failure(kExitCaller, "--extensions " + list,
+            throw Failure(kExitCaller, host::system::PathOfText("--extensions " + list),
                           "is not a list of endings with commas between them",
                           "write it such as mov,mp4,mxf");
         }
@@ -116,7 +117,8 @@ std::vector<Problem> ForEachByEnding(
         }
     }
     if (error) {
-        throw Failure(kExitCaller, folder, "the folder can't be listed: " + error.message());
+        throw Failure(kExitCaller, folder,
+                      "the folder can't be listed: " + error.default_error_condition().message());
     }
     std::sort(noFiles.begin(), noFiles.end(),
               [](const Problem& a, const Problem& b) { return a.subject < b.subject; });

@@ -7,6 +7,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
@@ -165,7 +166,7 @@ void AddFormats(CLI::App& app, const SessionOptions& session, int&) {
     auto movie = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);
     auto parameters = std::make_shared<ParameterOptions>();
-    verb->add_option("movie", *movie, "The movie")->required();
+    AddPath(*verb, "movie", *movie, "The movie")->required();
     verb->add_flag("--json", *json, kJsonHelp);
     parameters->AddTo(*verb);
     verb->callback([&session, movie, json, parameters] {

@@ -8,6 +8,7 @@
 #include <limits>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Number.h"
 
 namespace cliphost {
@@ -53,7 +54,8 @@ FrameRange ParseFrameRange(const std::string& text) {
                         (!hasEnd || ReadNumber(parts[1], end)) &&
                         (parts.size() < 3 || ReadNumber(parts[2], range.step)) && range.step > 0;
     if (!isGood || (hasEnd && end <= range.first)) {
-        throw Failure(kExitCaller, "--range " + text, "this is not a range",
+        throw Failure(kExitCaller, host::system::PathOfText("--range " + text),
+                      "this is not a range",
                       "write FIRST:END or FIRST:END:STEP, such as 0:25 for frames 0 to 24, or 100: "
                       "for all from 100 on");
     }

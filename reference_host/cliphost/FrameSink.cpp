@@ -12,6 +12,7 @@
 #include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -152,7 +153,7 @@ bool IsRawFile(const std::filesystem::path& output) {
 std::unique_ptr<FrameSink> MakeFrameSink(const std::filesystem::path& output,
                                          const std::filesystem::path& movie, bool isOneFrame,
                                          const PictureTurn& turn) {
-    const std::string ending = output.extension().string();
+    const std::string ending = host::system::PathText(output.extension());
     std::error_code ignored;
     RefuseOutputOntoMovie(output, movie);
     if (std::filesystem::is_directory(output, ignored)) {

@@ -4,9 +4,11 @@
 
 #include "reference_host/cliphost/FramePieces.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/WorkerOptions.h"
 #include "reference_host/system/FileNumber.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -32,7 +34,7 @@ void AddFrameForParent(CLI::App& app, const SessionOptions& session, int& status
     const auto movie = std::make_shared<std::filesystem::path>();
     CLI::App* const verb = AddWorkerVerb(app, worker);
     form->AddTo(*verb);
-    verb->add_option("--of-movie", *movie);
+    AddPath(*verb, "--of-movie", *movie);
     verb->callback([&session, &status, worker, form, movie] {
         ServePieces(session, *worker, *movie, *form);
         status = kExitFine;
@@ -54,15 +56,14 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
         "    ffplay -f rawvideo -pixel_format uyvy422 -video_size 1920x1080 -framerate 25 -i -\n\n"
         "For raw frames, standard error shows pixel format, size and rate.");
     auto options = std::make_shared<FrameOptions>();
-    verb->add_option("movie", options->movie, "The movie")->required();
+    AddPath(*verb, "movie", options->movie, "The movie")->required();
     auto* const frame = verb->add_option("--frame", options->frame, "Number of the frame, from 0")
                             ->check(WholeNumber())
                             ->capture_default_str();
     verb->add_option("--range", options->range,
                      "FIRST:END or FIRST:END:STEP; END itself is not written, and may be left out")
         ->excludes(frame);
-    verb->add_option(
-            "-o,--output", options->output,
+    AddPath(*verb, "-o,--output", options->output,
             "FILE.png, FILE.raw, a folder for one PNG per frame, or - for raw frames on standard "
             "output")
         ->required();
@@ -79,7 +80,8 @@ void AddFrame(CLI::App& app, const SessionOptions& session, int& status) {
         // What is wrong with the module is told as by one process.
         const Session tried(options->form.Of(session));
         TakeWorkerVerb(app, *verb, "frame-for-parent", session, options->workers);
-        options->workers.arguments.push_back("--of-movie=" + options->movie.native());
+        options->workers.arguments.push_back("--of-movie=" +
+                                             host::system::PathText(options->movie));
         status = WriteFramesInPieces(*options, wanted);
     });
 }

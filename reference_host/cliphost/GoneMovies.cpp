@@ -6,6 +6,7 @@
 
 #include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
@@ -34,8 +35,8 @@ public:
         const std::filesystem::path folder = AbsolutePath(asGiven / "");
         std::vector<std::string> gone;
         // Movies whose names are no UTF-8 go by URLs.
-        const std::string& bytes = folder.native();
-        for (const std::string& start : {bytes, host::text::FileUrl(bytes)}) {
+        for (const std::string& start :
+             {host::system::PathText(folder), host::system::UrlOfPath(folder)}) {
             for (const std::string& path : catalog_.PathsThatBegin(start)) {
                 const std::filesystem::path movie = PathOfMachinePath(path);
                 if (IsMeant(movie.lexically_relative(folder), asGiven) && IsGoneFromFolder(movie)) {
@@ -75,8 +76,8 @@ private:
         const bool hasEnding = options_.endings.empty() ? rest.extension() == ".mov"
                                                         : HasEnding(rest, options_.endings);
         return isWithin && hasEnding &&
-               (options_.shard.IsWhole() ||
-                options_.shard.Holds((folder / rest).lexically_normal()));
+               (options_.shard.IsWhole() || options_.shard.Holds(host::system::GenericPathText(
+                                                (folder / rest).lexically_normal())));
     }
 
     const MoviesOptions& options_;

@@ -4,6 +4,7 @@
 #include "reference_host/cliphost/HelpWords.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputFolder.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 
 namespace cliphost {
@@ -32,7 +33,7 @@ void AddHelpFiles(CLI::App& app) {
         "help-files", "Write the manual pages and the completions of shells into a folder");
     verb->group("");  // for packages
     auto folder = std::make_shared<std::filesystem::path>();
-    verb->add_option("folder", *folder, "The folder")->required();
+    AddPath(*verb, "folder", *folder, "The folder")->required();
     verb->callback([&app, folder] { WriteHelpFiles(app, *folder); });
 }
 

@@ -8,6 +8,8 @@
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/system/Access.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
@@ -26,7 +28,7 @@ public:
 
     std::vector<std::filesystem::path::string_type> Read() {
         const std::unique_ptr<std::FILE, int (*)(std::FILE*)> opened(
-            isStandardInput_ ? nullptr : std::fopen(name_.c_str(), "rb"), CloseIfOpen);
+            isStandardInput_ ? nullptr : host::system::OpenToRead(name_), CloseIfOpen);
         std::FILE* const file = isStandardInput_ ? stdin : opened.get();
         if (file == nullptr) {
             FailForSystem(errno);
@@ -84,9 +86,9 @@ private:
         isFirst_ = false;
         if (!path_.empty()) {
             if (host::text::IsFileUrl(path_)) {
-                host::text::PathOfFileUrl(path_, path_);  // what it leaves is told as no file
+                host::system::PathTextOfUrl(path_, path_);  // what it leaves is told as no file
             }
-            paths_.push_back(path_);
+            paths_.push_back(host::system::PathOfText(path_).native());
         }
         path_.clear();
     }

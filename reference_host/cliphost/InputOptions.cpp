@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/InputOptions.h"
 
 #include "reference_host/cliphost/FolderTree.h"
+#include "reference_host/cliphost/PathOption.h"
 
 namespace cliphost {
 namespace {
@@ -12,10 +13,10 @@ constexpr char kGroup[] = "Which movies";
 }  // namespace
 
 CLI::Option* AddInputOptions(CLI::App& verb, MoviesOptions& movies) {
-    verb.add_option("paths", movies.paths, "Movies and folders");
-    auto* const list = verb.add_option("--files-from", movies.list,
-                                       "Also the movies and folders of a list, a path in each "
-                                       "line; - for standard input")
+    AddPaths(verb, "paths", movies.paths, "Movies and folders");
+    auto* const list = AddPath(verb, "--files-from", movies.list,
+                               "Also the movies and folders of a list, a path in each "
+                               "line; - for standard input")
                            ->group(kGroup);
     verb.add_flag_callback(
             "-0,--null", [&movies] { movies.listForm = ListForm::Nulls; },

@@ -14,6 +14,7 @@
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
@@ -99,7 +100,7 @@ std::string ToBytes(const MovieAnswer& answer) {
     const Problem& problem = answer.problem;
     FieldWriter writer;
     writer.Add(static_cast<std::uint64_t>(answer.status))
-        .Add(problem.subject.native())
+        .Add(host::system::PathText(problem.subject))
         .Add(problem.reason)
         .Add(problem.hint)
         .Add(static_cast<ncfUInt32>(problem.code))
@@ -120,7 +121,7 @@ bool FromBytes(std::string_view bytes, const DescriptionForm& form, MovieAnswer&
     FieldReader fields(bytes);
     const std::uint64_t status = fields.Number();
     Problem& problem = answer.problem;
-    problem.subject = fields.Text();
+    problem.subject = host::system::PathOfText(fields.Text());
     problem.reason = fields.Text();
     problem.hint = fields.Text();
     problem.code = static_cast<NCFRESULT>(fields.Number());

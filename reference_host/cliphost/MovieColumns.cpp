@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/TimecodeText.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
@@ -108,7 +109,7 @@ void MovieColumns::LoadRow(const std::vector<std::string>& cells, std::uint64_t 
         CheckValue(row, row.values.back());
     }
     if (host::text::IsFileUrl(row.movie)) {
-        host::text::PathOfFileUrl(row.movie, row.movie);  // what it leaves is no movie's path
+        host::system::PathTextOfUrl(row.movie, row.movie);  // what it leaves is no movie's path
     }
     const auto add = [&](std::unordered_map<std::string, std::size_t>& rows,
                          const std::string& key) {
@@ -119,8 +120,9 @@ void MovieColumns::LoadRow(const std::vector<std::string>& cells, std::uint64_t 
                           "leave one out, or name movies by their paths");
         }
     };
-    add(byPath_, AbsolutePath(row.movie));
-    if (row.movie.find('/') == std::string::npos) {
+    const std::filesystem::path movie = host::system::PathOfText(row.movie);
+    add(byPath_, host::system::PathText(AbsolutePath(movie)));
+    if (!movie.has_parent_path()) {
         add(byName_, row.movie);
     }
     rows_.push_back(std::move(row));
@@ -141,11 +143,12 @@ void MovieColumns::CheckValue(const Row& row, const Value& value) const {
 }
 
 const MovieColumns::Row* MovieColumns::Find(const std::filesystem::path& movie) const {
-    if (const auto row = byPath_.find(AbsolutePath(movie)); row != byPath_.end()) {
+    if (const auto row = byPath_.find(host::system::PathText(AbsolutePath(movie)));
+        row != byPath_.end()) {
         return &rows_[row->second];
     }
     for (const std::filesystem::path& name : {movie.filename(), movie.stem()}) {
-        if (const auto row = byName_.find(name.native()); row != byName_.end()) {
+        if (const auto row = byName_.find(host::system::PathText(name)); row != byName_.end()) {
             return &rows_[row->second];
         }
     }

@@ -13,6 +13,7 @@
 #include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -62,14 +63,15 @@ public:
     }
 
 private:
-    static std::uint32_t Keep(const std::string& path, PathList& paths) {
+    static std::uint32_t Keep(const PathList::Text& path, PathList& paths) {
         paths.Add(path);
         return static_cast<std::uint32_t>(paths.size() - 1);
     }
 
     // `asGiven` does not depend on where the caller's working folder is mounted.
     bool IsOfShare(const std::filesystem::path& asGiven) const {
-        return options_.shard.IsWhole() || options_.shard.Holds(asGiven.lexically_normal());
+        return options_.shard.IsWhole() ||
+               options_.shard.Holds(host::system::GenericPathText(asGiven.lexically_normal()));
     }
 
     template <class Place>
@@ -115,7 +117,9 @@ private:
         return number;
     }
 
-    bool Takes(const std::filesystem::path& name) { return names_.taken.insert(name).second; }
+    bool Takes(const std::filesystem::path& name) {
+        return names_.taken.insert(name.native()).second;
+    }
 
     // 0 for a movie that is in no record. One that is given twice has two outputs.
     unsigned RecordedNumber(const std::filesystem::path& movie) {
@@ -134,7 +138,7 @@ private:
     // The record of a run that goes on meanwhile, on another share, changes no number: what it
     // holds was given in this way.
     unsigned NewNumber(const std::filesystem::path& movie) {
-        unsigned& number = names_.lastNumbers[OutputName(movie, 1, ending_)];
+        unsigned& number = names_.lastNumbers[OutputName(movie, 1, ending_).native()];
         for (;;) {
             const std::filesystem::path name = OutputName(movie, ++number, ending_);
             if (!(done_ && done_->Keeps(name)) && Takes(name)) {
@@ -282,7 +286,7 @@ bool MoviePlan::MayBeOutput(std::size_t place, const char* ending) const {
     // Letters' case counts on some disks, and on others it doesn't.
     const auto endsSo = [&] {
         const std::filesystem::path movie((*this)[place].movie);
-        return InSmallLetters(movie.extension().native()) == ending;
+        return InSmallLetters(host::system::PathText(movie.extension())) == ending;
     };
     return list == kNamed || (list == kFound && endsSo());
 }
@@ -296,8 +300,8 @@ std::filesystem::path OutputName(const std::filesystem::path& movie, unsigned nu
 
 unsigned NumberInName(const std::filesystem::path& name, const std::filesystem::path& movie,
                       const char* ending) {
-    const std::string stem = movie.stem();
-    const std::string& text = name.native();
+    const std::string stem = host::system::PathText(movie.stem());
+    const std::string text = host::system::PathText(name);
     const std::size_t from = stem.size() + 1;  // behind the hyphen
     unsigned number = 1;
     if (text.size() > from) {

@@ -24,9 +24,10 @@ class DoneMovies;
 // The names that outputs have, where plans follow each other: a movie that comes again keeps its
 // own.
 struct OutputNames {
-    std::unordered_set<std::string> taken;
-    std::unordered_map<std::string, unsigned> lastNumbers;  // by the name without one
-    std::unordered_map<std::string, unsigned> byMovie;
+    using Name = std::filesystem::path::string_type;
+    std::unordered_set<Name> taken;
+    std::unordered_map<Name, unsigned> lastNumbers;  // by the name without one
+    std::unordered_map<Name, unsigned> byMovie;
 };
 
 struct MoviesOptions {

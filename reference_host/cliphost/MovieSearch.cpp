@@ -12,6 +12,7 @@
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/FileNumber.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -41,7 +42,8 @@ private:
             }
         }
         if (error) {
-            Notice("cliphost: {}: not searched: {}\n", host::DisplayPath(folder), error.message());
+            Notice("cliphost: {}: not searched: {}\n", host::DisplayPath(folder),
+                   error.default_error_condition().message());
         }
         std::sort(files.begin(), files.end());
         for (std::filesystem::path& file : files) {
@@ -60,7 +62,7 @@ private:
 }  // namespace
 
 std::string SoughtEnding(const std::filesystem::path& path) {
-    return InSmallLetters(path.extension().string());
+    return InSmallLetters(host::system::PathText(path.extension()));
 }
 
 std::vector<std::filesystem::path> FilesIn(const std::vector<std::filesystem::path>& folders,

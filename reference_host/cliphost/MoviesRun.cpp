@@ -6,7 +6,6 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <csignal>
 #include <cstdio>
 #include <system_error>
 
@@ -20,6 +19,7 @@
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/OutputStream.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
@@ -180,7 +180,7 @@ void MoviesRun::Remember(std::size_t place, const MovieStep& step,
     if (options_.skipDone) {
         Record(place, step, saved.filename(), DoneMovies::Known::ByContent);
     } else {
-        outputs_.emplace_back(static_cast<std::uint32_t>(place), saved.filename());
+        outputs_.emplace_back(static_cast<std::uint32_t>(place), saved.filename().native());
     }
 }
 
@@ -211,7 +211,7 @@ int MoviesRun::Left() const {
 }
 
 void MoviesRun::TellStop() {
-    if (DelayedSignals::Which() == SIGPIPE) {
+    if (DelayedSignals::ReaderHasGone()) {
         return;  // who reads what is printed has seen enough
     }
     // A run that keeps no record from the start keeps one for the next.
@@ -291,9 +291,10 @@ void MoviesRun::RunInChildren() {
     }
     // The children open each movie by its path.
     plan_->EndLists();
-    const WorkerRequests requests = {placesOfRequests_.size(), [this](std::size_t number) {
-                                         return plan()[placesOfRequests_[number]].movie;
-                                     }};
+    const WorkerRequests requests = {
+        placesOfRequests_.size(), [this](std::size_t number) {
+            return host::system::PathText(plan()[placesOfRequests_[number]].movie);
+        }};
     WorkerCall call = options_.workers;
     if (Collects()) {
         call.writeNear = host::system::TemporaryFolder();

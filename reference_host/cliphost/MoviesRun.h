@@ -141,11 +141,12 @@ private:
     std::size_t nextPlace_ = 0;
     std::map<std::size_t, MovieAnswer> answers_;  // that were read and not yet shown
     std::optional<Progress> progress_;
-    std::set<std::string> targetsTaken_;  // names in the folder
+    std::set<std::filesystem::path::string_type> targetsTaken_;  // names in the folder
     std::optional<PlacesByFile> guarded_;
     std::optional<DoneMovies> doneMovies_;
     bool canRecord_ = true;
-    std::vector<std::pair<std::uint32_t, std::string>> outputs_;  // of places; for a stop
+    // Of places; for a stop.
+    std::vector<std::pair<std::uint32_t, std::filesystem::path::string_type>> outputs_;
     int countedBefore_ = 0;  // of what the options named before
     int doneBefore_ = 0;
     bool isStopped_ = false;

@@ -10,6 +10,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/Number.h"
 
@@ -81,7 +82,7 @@ void RefuseEmptyTexts(CLI::App& app) {
 void TakeFileUrls(CLI::App& app) {
     const CLI::Validator toPath(
         [](std::string& text) {
-            return !host::text::IsFileUrl(text) || host::text::PathOfFileUrl(text, text)
+            return !host::text::IsFileUrl(text) || host::system::PathTextOfUrl(text, text)
                        ? std::string()
                        : fmt::format(
                              "'{}' names no file of this machine; write file:///FOLDER/FILE "

@@ -9,11 +9,18 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/system/Access.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 
 using host::system::DescriptorOf;
 using host::system::IsStandardOutput;
+
+void RefuseName(const std::filesystem::path& output) {
+    if (const std::string problem = host::system::NameProblem(output); !problem.empty()) {
+        throw Failure(kExitCaller, output, problem, "take another name");
+    }
+}
 
 bool OutputFile::IsDevice(const std::filesystem::path& path) {
     std::error_code ignored;
@@ -28,10 +35,11 @@ OutputFile::OutputFile(std::filesystem::path path, Writer writer) : path_(std::m
         Check(stream_.OpenCopyOf(*open));
         return;
     }
+    RefuseName(path_);
     std::error_code error;
     const auto status = std::filesystem::status(path_, error);
     if (status.type() == std::filesystem::file_type::none) {
-        Fail(error.value());  // such as links in a circle
+        Fail(error.default_error_condition().value());  // such as links in a circle
     }
     if (std::filesystem::is_directory(status)) {
         Fail(EISDIR);
@@ -61,7 +69,7 @@ void OutputFile::Finish() {
     if (unfinished_) {
         std::error_code error;
         unfinished_->TakePlace(error);
-        Check(error.value());
+        Check(error.default_error_condition().value());
     }
 }
 
@@ -69,7 +77,7 @@ void OutputFile::FinishIfFree() {
     Check(stream_.Close());
     std::error_code error;
     unfinished_->TakePlaceIfFree(error);
-    Check(error.value());
+    Check(error.default_error_condition().value());
 }
 
 void OutputFile::TryPlace() {

@@ -19,6 +19,9 @@ public:
     ReaderGone() : std::runtime_error("the reader of the output has gone") {}
 };
 
+// Throws the Failure for a name that nothing can have, though the system might take it for another.
+void RefuseName(const std::filesystem::path& output);
+
 // A file that appears complete or not at all: it is written under another name in
 // the same folder and renamed when it is finished. An object that ends unfinished
 // leaves nothing behind. What can't be renamed is written directly: "-", which is

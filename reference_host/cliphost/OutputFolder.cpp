@@ -3,6 +3,7 @@
 #include "reference_host/cliphost/OutputFolder.h"
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
 
 namespace cliphost {
@@ -18,6 +19,7 @@ void RemoveEmpty(const std::vector<std::filesystem::path>& folders) {
 }  // namespace
 
 OutputFolder::OutputFolder(const std::filesystem::path& folder) {
+    RefuseName(folder);
     std::error_code error;
     std::vector<std::filesystem::path> missing;
     for (std::filesystem::path way = folder;
@@ -28,7 +30,7 @@ OutputFolder::OutputFolder(const std::filesystem::path& folder) {
     std::filesystem::create_directories(folder, error);
     if (error) {
         RemoveEmpty(missing);
-        throw Failure(kExitCaller, FolderNotMade(folder, error.value()));
+        throw Failure(kExitCaller, FolderNotMade(folder, error.default_error_condition().value()));
     }
     made_ = std::move(missing);
 }

@@ -21,7 +21,9 @@ struct Row {
 };
 constexpr Row kRows[] = {
     {ENOSPC, "make room there or name another place"},
+#ifdef EDQUOT
     {EDQUOT, "make room there or name another place"},
+#endif
     {EROFS, "name another place"},
     {EACCES, "get permission to write there or name another place"},
     {EPERM, "get permission to write there or name another place"},

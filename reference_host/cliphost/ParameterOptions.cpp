@@ -4,6 +4,7 @@
 #include "reference_host/cliphost/ParameterOptions.h"
 
 #include "reference_host/cliphost/ParameterFile.h"
+#include "reference_host/cliphost/PathOption.h"
 
 namespace cliphost {
 
@@ -13,7 +14,7 @@ void ParameterOptions::AddTo(CLI::App& verb) {
                     "A parameter and its value, such as \"Field Layout=Split\"; may be repeated")
         ->allow_extra_args(false)
         ->group(group);
-    verb.add_option("--set-xml", document_, "Values from a parameter document")->group(group);
+    AddPath(verb, "--set-xml", document_, "Values from a parameter document")->group(group);
     verb.add_flag("--reset", reset_, "First go back to what the file says, then apply --set")
         ->group(group);
 }

@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/ParameterOptions.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/framework/HostPath.h"
@@ -109,7 +110,7 @@ void AddParams(CLI::App& app, const SessionOptions& session, int&) {
         "  cliphost params clip.mov --set-xml my.xml --json\n"
         "  cliphost params clip.mov --xml description");
     auto options = std::make_shared<ParamsOptions>();
-    verb->add_option("movie", options->movie, "A movie")->required();
+    AddPath(*verb, "movie", options->movie, "A movie")->required();
     options->parameters.AddTo(*verb);
     auto* const xml = verb->add_option("--xml", options->xml,
                                        "Print a document: values, description or defaults");

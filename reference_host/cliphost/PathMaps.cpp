@@ -9,9 +9,14 @@
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
+
+using host::system::GenericPathText;
+using host::system::PathOfText;
+
 namespace {
 
 char Lower(char c) {
@@ -62,7 +67,7 @@ void TakeMachineFromPath(UrlPlace& place) {
         place.machine = path.substr(2, end - 2);
     }
     place.path = path.substr(end);
-    place.path = std::filesystem::path(place.path).lexically_normal().generic_string();
+    place.path = GenericPathText(PathOfText(place.path).lexically_normal());
 }
 
 bool ReadPath(std::string text, UrlPlace& place) {
@@ -104,7 +109,7 @@ bool UrlPlace::IgnoresCase() const {
 
 void PathMaps::Add(std::string_view rule) {
     const auto refuse = [&](const std::string& reason, const char* hint) {
-        throw Failure(kExitCaller, fmt::format("--map {}", rule), reason, hint);
+        throw Failure(kExitCaller, PathOfText(fmt::format("--map {}", rule)), reason, hint);
     };
     const std::size_t equals = rule.find('=');
     if (equals == std::string_view::npos || equals == 0 || equals + 1 == rule.size()) {
@@ -115,9 +120,11 @@ void PathMaps::Add(std::string_view rule) {
     }
     Rule added{std::string(rule), {}, {}};
     std::string from(rule.substr(0, equals));
-    if (!ReadPlace(from, added.here)) {
+    const std::filesystem::path folder = PathOfText(from);
+    const bool isOfThisDrive = folder.has_root_directory() && !folder.is_absolute();
+    if (isOfThisDrive || !ReadPlace(from, added.here)) {
         // The module is given paths in this form.
-        added.here.path = AbsolutePath(from).generic_string();
+        ReadPath(GenericPathText(AbsolutePath(folder)), added.here);
     }
     if (!ReadPlace(std::string(rule.substr(equals + 1)), added.there)) {
         refuse("TO is no absolute path",

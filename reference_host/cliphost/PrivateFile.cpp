@@ -9,6 +9,7 @@
 
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputFile.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -57,7 +58,7 @@ void RemovePrivateFiles(const std::filesystem::path& folder, std::uint64_t numbe
     std::vector<std::filesystem::path> files;
     for (std::filesystem::directory_iterator entry(folder, error), end; !error && entry != end;
          entry.increment(error)) {
-        const std::string name = entry->path().filename();
+        const std::string name = host::system::PathText(entry->path().filename());
         if (name.compare(0, own.size(), own) == 0 &&
             (name.size() == own.size() || name[own.size()] < '0' || name[own.size()] > '9')) {
             files.push_back(entry->path());
@@ -83,7 +84,7 @@ void PutIntoPlace(const std::filesystem::path& file, const std::filesystem::path
             std::filesystem::remove(file, ignored);
         }
         if (error) {
-            output.Fail(error.value());
+            output.Fail(error.default_error_condition().value());
         }
     }
     output.Finish();

@@ -17,6 +17,7 @@
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/SettingsFile.h"
 #include "reference_host/cliphost/SettingsOptions.h"
 #include "reference_host/cliphost/Verbs.h"
@@ -79,10 +80,10 @@ void TellExitStatus(CLI::App& app) {
     }
 }
 
-int Run(int argc, char** argv) {
+int Run(const std::vector<std::string>& words) {
     using namespace cliphost;
     SessionOptions session;
-    session.program = host::system::ProgramFile(argv[0]);
+    session.program = host::system::ProgramFile(words[0].c_str());
     session.programFolder = session.program.parent_path();
     int status = kExitFine;
 
@@ -95,9 +96,9 @@ int Run(int argc, char** argv) {
     app.set_version_flag("--version", "cliphost " PRODUCT_VERSION_TEXT);
     app.add_flag("-v", session.verbosity,
                  "Show the module's console lines on standard error; -vv shows its log too");
-    app.add_option("--plugin", session.plugin,
-                   "Use this module file instead of the one beside the program");
-    app.add_option("--aaf-library", session.aafLibrary, "Use this build of the AAF library");
+    AddPath(app, "--plugin", session.plugin,
+            "Use this module file instead of the one beside the program");
+    AddPath(app, "--aaf-library", session.aafLibrary, "Use this build of the AAF library");
 
     app.parse_complete_callback([&] {
         RefuseUnreadSettings(app);
@@ -138,8 +139,8 @@ int Run(int argc, char** argv) {
 
     try {
         std::vector<std::string> arguments;
-        for (int i = argc - 1; i > 0; --i) {  // the parser takes the last first
-            arguments.push_back(MarkedText(argv[i]));
+        for (std::size_t i = words.size() - 1; i > 0; --i) {  // the parser takes the last first
+            arguments.push_back(MarkedText(words[i]));
         }
         try {
             app.parse(std::move(arguments));
@@ -173,9 +174,9 @@ int Run(int argc, char** argv) {
 
 namespace cliphost {
 
-int RunProgram(int argc, char** argv) {
+int RunProgram(const std::vector<std::string>& commandLine) {
     host::system::PrepareProcess();
-    return FlushOutput(Run(argc, argv));
+    return FlushOutput(Run(commandLine));
 }
 
 }  // namespace cliphost

@@ -21,6 +21,7 @@
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/FileNumber.h"
 #include "reference_host/system/OutputStream.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -65,7 +66,7 @@ RelinkPlan PlanOf(const CheckedClip& checked, PathMaps& maps) {
     // A clip that names no place gets one, too.
     const std::size_t needed = std::max<std::size_t>(plan.strays.size(), plan.leads.empty());
     for (std::size_t i = 0; i < std::min(needed, checked.found.size()); ++i) {
-        plan.found.push_back(host::text::FileUrl(checked.found[i].native()));
+        plan.found.push_back(host::system::UrlOfPath(checked.found[i]));
         maps.MapToOther(plan.found.back());
         // Two folders here may be one there.
         if (plan.strays.erase(plan.found.back()) > 0) {
@@ -112,7 +113,7 @@ public:
         }
         while (const std::optional<aafUInt32> stray = Find(isStray)) {
             if (descriptor_.RemoveLocatorAt(*stray) < 0) {
-                throw Failure(kExitFile, PathOf(*LocatorAt(*stray)),
+                throw Failure(kExitFile, host::system::PathOfText(PathOf(*LocatorAt(*stray))),
                               "the AAF library does not remove this locator");
             }
             --count_;
@@ -176,7 +177,7 @@ std::string LineOfPlan(const RelinkPlan& plan) {
                          : i == used ? "; the same content is in "
                                      : ", ") +
                         host::DisplayPath(found);
-                if (i < used && plan.found[i] != host::text::FileUrl(found.native())) {
+                if (i < used && plan.found[i] != host::system::UrlOfPath(found)) {
                     line += ", written as " + plan.found[i];
                 }
             }

@@ -4,6 +4,7 @@
 #include "reference_host/cliphost/CheckOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Relink.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/system/OutputStream.h"
@@ -22,9 +23,9 @@ void AddRelink(CLI::App& app, const SessionOptions& session, int& status) {
         "not found gives\nstatus 1.");
     auto options = std::make_shared<RelinkOptions>();
     auto pinned = std::make_shared<std::string>();
-    verb->add_option("file", options->file, "The AAF file")->required();
-    verb->add_option("-o,--output", options->output,
-                     "Write the file here, which may be the same file; - for standard output")
+    AddPath(*verb, "file", options->file, "The AAF file")->required();
+    AddPath(*verb, "-o,--output", options->output,
+            "Write the file here, which may be the same file; - for standard output")
         ->required();
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->add_option("--pin-time", *pinned,

@@ -15,6 +15,7 @@
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/report/PageText.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 
 namespace cliphost {
@@ -52,7 +53,8 @@ void ReportFolder::Take(nlohmann::ordered_json& picture, std::size_t clip, const
     WriteWholeFile(aside_->path() / file, {bytes.begin(), bytes.end()});
     names_.insert(file);
     picture.erase("data");
-    picture["file"] = host::text::PercentEncoded((folder_.filename() / file).native());
+    picture["file"] =
+        host::text::PercentEncoded(host::system::GenericPathText(folder_.filename() / file));
 }
 
 void ReportFolder::PutIntoPlace() {
@@ -70,7 +72,7 @@ void ReportFolder::RemoveOthers() const {
     std::vector<std::filesystem::path> others;
     for (std::filesystem::directory_iterator entry(folder_, ignored), end; entry != end;
          entry.increment(ignored)) {
-        const std::string name = entry->path().filename();
+        const std::string name = host::system::PathText(entry->path().filename());
         if (IsPictureName(name) && names_.count(name) == 0) {
             others.push_back(entry->path());
         }

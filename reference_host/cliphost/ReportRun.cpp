@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/cliphost/ReportRun.h"
 
+#include <fmt/chrono.h>
 #include <fmt/format.h>
 
 #include <ctime>
@@ -21,6 +22,7 @@
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/FileUrl.h"
+#include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
 namespace {
@@ -42,10 +44,7 @@ const DescriptionForm& FormOfClip() {
 
 // "2026-01-31T12:00:00Z"
 std::string TimeText(std::time_t seconds) {
-    char text[32];
-    std::tm parts{};
-    gmtime_r(&seconds, &parts);
-    return {text, std::strftime(text, sizeof text, "%Y-%m-%dT%H:%M:%SZ", &parts)};
+    return fmt::format("{:%Y-%m-%dT%H:%M:%SZ}", fmt::gmtime(seconds));
 }
 
 bool IsDatabase(const std::filesystem::path& file) {
@@ -62,7 +61,7 @@ std::string Dumped(const Json& json) {
 
 std::string TitleOf(const ReportOptions& options) {
     if (!options.title.empty()) {
-        return host::DisplayPath(options.title);
+        return host::text::Printable(options.title);
     }
     const std::vector<std::filesystem::path>& paths = options.movies.paths;
     if (paths.size() != 1) {
@@ -123,7 +122,8 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
     output_.emplace(file);
     if (options.isSplit) {
         std::filesystem::path folder = file;
-        pictures_.emplace(folder.replace_filename(file.stem().native() + kEndingOfFolder));
+        folder.replace_filename(file.stem());
+        pictures_.emplace(folder += kEndingOfFolder);
     }
     page_.emplace(
         [this](std::string_view text) {
@@ -213,7 +213,7 @@ void ReportRun::AddFile(const std::filesystem::path& movie, Json& facts) {
     facts["path"] = MachinePath(whole);
     facts["file"] = host::DisplayPath(whole.filename());
     facts["folder"] = host::DisplayPath(whole.parent_path());
-    std::string url = host::text::FileUrl(whole.native());
+    std::string url = host::system::UrlOfPath(whole);
     if (maps_.MapToOther(url)) {
         facts["place"] = url;
     }

@@ -4,6 +4,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/ReportClip.h"
 #include "reference_host/cliphost/ReportRun.h"
 #include "reference_host/cliphost/Verbs.h"
@@ -56,9 +57,8 @@ void AddReport(CLI::App& app, const SessionOptions& session, int& status) {
         "and folders, and no catalogs. A\nmovie that can't be described is in the page too, with "
         "the reason.");
     auto options = std::make_shared<ReportOptions>();
-    auto* const output =
-        verb->add_option("-o,--output", options->movies.together,
-                         "The page, such as report.html, or - for standard output");
+    auto* const output = AddPath(*verb, "-o,--output", options->movies.together,
+                                 "The page, such as report.html, or - for standard output");
     auto* const json = verb->add_flag("--json", options->json,
                                       "Print what the page is made of instead, as JSON; pictures "
                                       "are WebP in base64. A path that is not UTF-8 is given as a "

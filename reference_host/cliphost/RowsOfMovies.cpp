@@ -22,7 +22,7 @@ void RowsOfMovies::Find(const MoviePlan& plan, const Clash& clash) {
             continue;
         }
         const auto [place, isFirstNow] = places.emplace(row, i);
-        std::string& movie = movies_.emplace(row, step.movie).first->second;
+        std::filesystem::path::string_type& movie = movies_.emplace(row, step.movie).first->second;
         std::error_code ignored;
         if (movie == step.movie) {
             continue;

@@ -27,7 +27,7 @@ public:
 
 private:
     const GivenColumns& columns_;
-    std::map<const MovieColumns::Row*, std::string> movies_;
+    std::map<const MovieColumns::Row*, std::filesystem::path::string_type> movies_;
 };
 
 }  // namespace cliphost

@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Progress.h"
 #include "reference_host/cliphost/RouteTaken.h"
 #include "reference_host/cliphost/SampleMap.h"
@@ -233,7 +234,7 @@ void AddSamples(CLI::App& app, const SessionOptions& session, int& status) {
         "place:\nso many samples later in the list. Totals that do not agree with "
         "the file give exit status 1.");
     auto options = std::make_shared<SamplesOptions>();
-    verb->add_option("movie", options->movie, "The movie")->required();
+    AddPath(*verb, "movie", options->movie, "The movie")->required();
     verb->add_option("--track", options->track, "Only the track of this number")
         ->check(SmallWholeNumber());
     verb->add_flag("--every", options->every, "List every sample of sound, not only its runs");

@@ -8,6 +8,7 @@
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
@@ -113,7 +114,7 @@ void AddScan(CLI::App& app, const SessionOptions& options, int& status) {
         "  cliphost scan ~/Videos --json");
     auto folder = std::make_shared<std::filesystem::path>();
     auto json = std::make_shared<bool>(false);
-    verb->add_option("folder", *folder, "The folder")->required();
+    AddPath(*verb, "folder", *folder, "The folder")->required();
     verb->add_flag("--json", *json, kJsonHelp);
     verb->callback([&options, &status, folder, json] {
         AnswerFailureToo(*json, schema::kScan, {{"folder", MachinePath(*folder)}}, [&] {

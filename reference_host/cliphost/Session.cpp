@@ -49,7 +49,7 @@ aafTimeStamp_t ParseTime(const std::string& text) {
                                            &day, &hour, &minute, &second) == 6;
     if (!isTime || year < 1 || month < 1 || month > 12 || day < 1 || day > DaysIn(year, month) ||
         hour > 23 || minute > 59 || second > 59) {
-        throw Failure(kExitCaller, "--pin-time " + text, "not a time",
+        throw Failure(kExitCaller, host::system::PathOfText("--pin-time " + text), "not a time",
                       "write 2026-01-31T12:00:00Z");
     }
     aafTimeStamp_t time{};

@@ -6,7 +6,6 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <cstdlib>
 #include <fstream>
 #include <map>
 #include <sstream>
@@ -15,6 +14,8 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/SettingsText.h"
+#include "reference_host/system/Paths.h"
+#include "reference_host/system/Process.h"
 
 namespace cliphost {
 namespace {
@@ -35,7 +36,7 @@ int ReadErrorOf(const std::filesystem::path& file) {
     std::error_code error;
     const auto kind = std::filesystem::status(file, error).type();
     return kind == std::filesystem::file_type::not_found   ? ENOENT
-           : error                                         ? error.value()
+           : error                                         ? error.default_error_condition().value()
            : kind == std::filesystem::file_type::directory ? EISDIR
                                                            : EACCES;
 }
@@ -79,7 +80,7 @@ public:
     // All is done here; the parser itself is left nothing to do.
     std::vector<CLI::ConfigItem> from_config(std::istream& stream) const override {
         if (app_.get_option(kNoSettingsFile)->count() == 0 && !IsHelpAsked()) {
-            const auto file = app_.get_config_ptr()->as<std::string>();
+            const auto file = host::system::PathOfText(app_.get_config_ptr()->as<std::string>());
             Read(file, TextOf(file, stream));
         }
         return {};
@@ -264,21 +265,13 @@ private:
 
 std::filesystem::path DefaultSettingsFile() {
     constexpr char kName[] = "cliphost.toml";
-    const auto folder = [](const char* variable) {
-        const char* const value = std::getenv(variable);
-        const std::filesystem::path path = value ? value : "";
-        return path.is_absolute() ? path : std::filesystem::path();
-    };
-    if (const auto own = folder("XDG_CONFIG_HOME"); !own.empty()) {
-        return own / kName;
-    }
-    const auto home = folder("HOME");
-    return home.empty() ? home : home / ".config" / kName;
+    const std::filesystem::path folder = host::system::SettingsFolder();
+    return folder.empty() ? folder : folder / kName;
 }
 
 void AddSettingsFile(CLI::App& app) {
     app.set_config(
-        "--config", DefaultSettingsFile().string(),
+        "--config", host::system::PathText(DefaultSettingsFile()),
         "Read options from this file instead of ~/.config/cliphost.toml; those of the command line "
         "win over it");
     app.add_flag(kNoSettingsFile, "Read no such file")->configurable(false);
@@ -297,9 +290,9 @@ void RefuseUnreadSettings(CLI::App& app) {
 }
 
 void RefuseGivenSettings(const CLI::App& app) {
+    const auto& given = app.get_config_ptr()->results();
     const std::filesystem::path file =
-        WithoutMarks(app.get_config_ptr()->results().empty() ? std::string()
-                                                             : app.get_config_ptr()->results()[0]);
+        host::system::PathOfText(WithoutMarks(given.empty() ? std::string() : given[0]));
     FailToRead(file, ReadErrorOf(file));
 }
 

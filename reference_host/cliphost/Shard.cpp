@@ -4,6 +4,7 @@
 
 #include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Number.h"
 
 namespace cliphost {
@@ -22,7 +23,8 @@ Shard::Shard(const std::string& text) {
                          host::text::ReadNumber(all.substr(slash + 1), count_) && number >= 1 &&
                          number <= count_ && count_ <= kMostShares;
     if (!isShard) {
-        throw Failure(kExitCaller, "--shard " + text, "is not I/N with I from 1 to N",
+        throw Failure(kExitCaller, host::system::PathOfText("--shard " + text),
+                      "is not I/N with I from 1 to N",
                       "write --shard 1/4 on the first of four machines, --shard 4/4 on the last");
     }
     place_ = number - 1;

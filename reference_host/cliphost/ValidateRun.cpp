@@ -17,6 +17,7 @@
 #include "reference_host/cliphost/ResultText.h"
 #include "reference_host/system/ChildProcess.h"
 #include "reference_host/system/DelayedSignals.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
 #include "reference_host/util/text/Printable.h"
 #include "reference_host/validate/Trial.h"
@@ -62,7 +63,8 @@ std::optional<Outcome> OutcomeIn(FieldReader& fields) {
 }
 
 Failure NoFolder(const std::filesystem::path& parent, const std::error_code& error) {
-    return {kExitCaller, parent, "no folder can be made there: " + error.message(),
+    return {kExitCaller, parent,
+            "no folder can be made there: " + error.default_error_condition().message(),
             "name another one in TMPDIR"};
 }
 
@@ -129,10 +131,10 @@ public:
     RunningCheck(const ValidateCall& call, std::size_t number, const std::filesystem::path& scratch)
         : call_(call), check_(*call.checks[number]), folder_(scratch, number) {
         std::vector<std::string> arguments = call.worker.arguments;
-        arguments.insert(
-            arguments.end(),
-            {"--of-module=" + call.module.native(), std::string("--check=") + check_.id,
-             fmt::format("--use-seed={}", call.seed), "--folder=" + folder_.path().native()});
+        arguments.insert(arguments.end(), {"--of-module=" + host::system::PathText(call.module),
+                                           std::string("--check=") + check_.id,
+                                           fmt::format("--use-seed={}", call.seed),
+                                           "--folder=" + host::system::PathText(folder_.path())});
         if (const int error = process_.Start(call.worker.program, arguments)) {
             throw Failure(kExitCaller, call.worker.program,
                           "no process can be started: " + std::generic_category().message(error));

@@ -15,6 +15,7 @@
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OptionChecks.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/ValidateRun.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
@@ -52,8 +53,8 @@ std::vector<const Check*> ChosenChecks(const std::vector<std::string>& ids) {
     for (const std::string& id : ids) {
         const Check* const check = validate::FindCheck(id.c_str());
         if (check == nullptr) {
-            throw Failure(kExitCaller, "--only " + id, "there is no such check",
-                          "cliphost validate --list names all of them");
+            throw Failure(kExitCaller, host::system::PathOfText("--only " + id),
+                          "there is no such check", "cliphost validate --list names all of them");
         }
         chosen.push_back(check);
     }
@@ -256,10 +257,10 @@ void AddValidateForParent(CLI::App& app, const SessionOptions& session, int& sta
         std::filesystem::path folder;
     };
     const auto work = std::make_shared<ForParent>();
-    verb->add_option("--of-module", work->call.module)->required();
+    AddPath(*verb, "--of-module", work->call.module)->required();
     verb->add_option("--check", work->check)->required();
     verb->add_option("--use-seed", work->call.seed)->required();
-    verb->add_option("--folder", work->folder)->required();
+    AddPath(*verb, "--folder", work->folder)->required();
     verb->callback([&session, &status, work] {
         work->call.checks = ChosenChecks({work->check});
         const auto library = LoadAafLibrary(session);
@@ -292,7 +293,7 @@ void AddValidate(CLI::App& app, const SessionOptions& session, int& status) {
     const auto options = std::make_shared<ValidateOptions>();
     options->call.worker.limits = {kUsualSeconds, kUsualMebibytes};
     options->call.seed = std::random_device()();
-    verb->add_option("module", options->call.module, "The module file");
+    AddPath(*verb, "module", options->call.module, "The module file");
     verb->add_option("--only", options->only, "Do this check alone; may be given several times")
         ->expected(1)
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);

@@ -4,6 +4,7 @@
 #include "reference_host/cliphost/CheckOptions.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/cliphost/PathOption.h"
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Verify.h"
 
@@ -24,7 +25,7 @@ void AddVerify(CLI::App& app, const SessionOptions& session, int& status) {
         "them apart. Another\nmaker's clip that is unknown gives 0: nothing in it tells which "
         "movie it is.");
     auto options = std::make_shared<VerifyOptions>();
-    verb->add_option("files", options->files, "AAF files")->required();
+    AddPaths(*verb, "files", options->files, "AAF files")->required();
     verb->add_flag("--json", options->json, kJsonHelp);
     AddCheckOptions(*verb, options->check);
     verb->callback([&app, &session, &status, options] {

@@ -6,6 +6,7 @@
 #include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/cliphost/Workers.h"
 #include "reference_host/quicktime/MovieComponents.h"
+#include "reference_host/system/Paths.h"
 
 namespace cliphost {
 namespace {
@@ -31,7 +32,8 @@ MovieAnswer AnswerOfMovie(const std::filesystem::path& movie,
         return Failed(failure.status(), failure.problem());
     } catch (const std::filesystem::filesystem_error& error) {
         // Most often a file that is not the movie, such as the folder of an output.
-        Problem problem{error.path1().empty() ? movie : error.path1(), error.code().message()};
+        Problem problem{error.path1().empty() ? movie : error.path1(),
+                        error.code().default_error_condition().message()};
         const int status = StatusOf(problem);
         return Failed(status, std::move(problem));
     } catch (const std::exception& error) {
@@ -53,8 +55,9 @@ CLI::App* AddWorkerVerb(CLI::App& app, const std::shared_ptr<WorkerVerb>& worker
     CLI::App* const verb = app.add_subcommand(worker->name, "Work for another cliphost");
     verb->group("");  // not for users
     // Lives as long as the verb.
-    verb->add_option_function<std::filesystem::path>(
-        "--folder", [worker](const std::filesystem::path& folder) { worker->folder = folder; });
+    verb->add_option_function<std::string>("--folder", [worker](const std::string& folder) {
+        worker->folder = host::system::PathOfText(folder);
+    });
     return verb;
 }
 
@@ -70,7 +73,8 @@ void Serve(Session& session, const WorkerVerb& worker,
 }
 
 void ServeMovies(Session& session, const WorkerVerb& worker, const AnswerToMovie& answer) {
-    Serve(session, worker, [&](std::uint64_t number, const std::string& movie) {
+    Serve(session, worker, [&](std::uint64_t number, const std::string& text) {
+        const std::filesystem::path movie = host::system::PathOfText(text);
         const PlaceOfFile place = [&] {
             return worker.folder.empty() ? std::filesystem::path()
                                          : PrivateFile(worker.folder, number);

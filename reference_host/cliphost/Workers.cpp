@@ -22,6 +22,7 @@
 #include "reference_host/system/Confinement.h"
 #include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/FileNumber.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
@@ -126,7 +127,7 @@ void Run::MakeScratchFolder() {
     }
     if (error) {
         throw Failure(kExitCaller, host::system::TemporaryFolder(),
-                      "no folder can be made there: " + error.message(),
+                      "no folder can be made there: " + error.default_error_condition().message(),
                       "name another one in TMPDIR");
     }
 }
@@ -240,9 +241,10 @@ int Run::Start(Worker& worker) {
     if (scratch_) {
         worker.folder = scratch_->path() / fmt::format("{}", foldersMade_++);
         std::filesystem::create_directory(worker.folder, folderError);
-        arguments.push_back("--folder=" + worker.folder.native());
+        arguments.push_back("--folder=" + host::system::PathText(worker.folder));
     }
-    return folderError ? folderError.value() : worker.process.Start(call_.program, arguments);
+    return folderError ? folderError.default_error_condition().value()
+                       : worker.process.Start(call_.program, arguments);
 }
 
 // The others have to do.

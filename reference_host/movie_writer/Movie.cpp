@@ -215,7 +215,7 @@ Bytes MadeMovie::ToBytes() const {
     return Range(0, size);
 }
 
-bool MadeMovie::WriteTo(const std::string& path) const {
+bool MadeMovie::WriteTo(const std::filesystem::path& path) const {
     {
         std::ofstream stream(path, std::ios::binary | std::ios::trunc);
         for (const auto& [position, piece] : pieces) {

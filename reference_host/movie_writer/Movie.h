@@ -4,6 +4,7 @@
 
 #include <array>
 #include <cstdint>
+#include <filesystem>
 #include <optional>
 #include <string>
 #include <utility>
@@ -128,8 +129,8 @@ struct MadeMovie {
     std::uint64_t headerSize = 0;
     std::vector<std::pair<std::uint64_t, Bytes>> pieces;  // the rest is zero
 
-    Bytes ToBytes() const;                        // whole, so for small movies
-    bool WriteTo(const std::string& path) const;  // with holes
+    Bytes ToBytes() const;                                  // whole, so for small movies
+    bool WriteTo(const std::filesystem::path& path) const;  // with holes
     // The bytes [position, position + size), zeros past the end.
     Bytes Range(std::uint64_t position, std::uint64_t size) const;
 };

@@ -220,7 +220,7 @@ InputOwner OpenInput(const std::filesystem::path& path, InputView view, std::str
     if (view == InputView::WholeMedia) {
         av_dict_set(&options, "ignore_editlist", "1", 0);
     }
-    const int error = avformat_open_input(&opened, path.c_str(), nullptr, &options);
+    const int error = avformat_open_input(&opened, path.u8string().c_str(), nullptr, &options);
     av_dict_free(&options);
     if (error < 0) {
         CloseBytes(bytes);

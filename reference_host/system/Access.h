@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstdio>
 #include <filesystem>
 
 namespace host::system {
@@ -19,5 +20,8 @@ struct FirstByte {
     bool isThere = false;
 };
 FirstByte ReadFirstByte(const std::filesystem::path& file);
+
+// A file to be read, by the C library; null, with its error number, where it can't be opened.
+std::FILE* OpenToRead(const std::filesystem::path& file);
 
 }  // namespace host::system

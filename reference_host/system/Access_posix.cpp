@@ -29,4 +29,8 @@ FirstByte ReadFirstByte(const std::filesystem::path& file) {
     return first;
 }
 
+std::FILE* OpenToRead(const std::filesystem::path& file) {
+    return std::fopen(file.c_str(), "rb");
+}
+
 }  // namespace host::system

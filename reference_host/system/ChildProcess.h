@@ -5,6 +5,7 @@
 #include <chrono>
 #include <cstddef>
 #include <filesystem>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -24,14 +25,14 @@ struct ProcessEnd {
 // nowhere. It ends with this object.
 class ChildProcess {
 public:
-    ChildProcess() = default;
-    ~ChildProcess() { End(); }
+    ChildProcess();
+    ~ChildProcess();
     ChildProcess(const ChildProcess&) = delete;
     ChildProcess& operator=(const ChildProcess&) = delete;
 
     // 0, or the system's error number.
     int Start(const std::filesystem::path& program, const std::vector<std::string>& arguments);
-    bool IsRunning() const { return process_ > 0; }
+    bool IsRunning() const { return ends_ != nullptr; }
 
     // Neither waits: what finds no room in the channel is kept, and sent with the rest.
     // False when the child takes nothing more.
@@ -55,9 +56,9 @@ public:
                            std::chrono::milliseconds most);
 
 private:
-    int process_ = 0;
-    int channel_ = -1;
-    int errors_ = -1;
+    struct Ends;  // the process, and our ends, as the system knows them
+
+    std::unique_ptr<Ends> ends_;
     std::string unsent_;
     bool hasMore_ = false;
 };

@@ -85,6 +85,23 @@ bool ReadSome(int descriptor, std::string& bytes) {
 
 }  // namespace
 
+struct ChildProcess::Ends {
+    pid_t process;
+    int channel;
+    int errors;
+
+    ~Ends() {
+        CloseIfOpen(channel);
+        CloseIfOpen(errors);
+    }
+};
+
+ChildProcess::ChildProcess() = default;
+
+ChildProcess::~ChildProcess() {
+    End();
+}
+
 unsigned UsableProcessors() {
     cpu_set_t processors;
     if (sched_getaffinity(0, sizeof processors, &processors) != 0) {
@@ -121,9 +138,7 @@ int ChildProcess::Start(const std::filesystem::path& program,
             posix_spawn(&process, name.c_str(), actions.get(), nullptr, line.data(), environ)) {
         return error;
     }
-    process_ = process;
-    channel_ = channel.Take(0);
-    errors_ = errors.Take(0);
+    ends_.reset(new Ends{process, channel.Take(0), errors.Take(0)});
     return 0;
 }
 
@@ -134,7 +149,7 @@ bool ChildProcess::Send(const std::string& bytes) {
 
 bool ChildProcess::SendRest() {
     while (!unsent_.empty()) {
-        const ssize_t now = send(channel_, unsent_.data(), unsent_.size(), MSG_NOSIGNAL);
+        const ssize_t now = send(ends_->channel, unsent_.data(), unsent_.size(), MSG_NOSIGNAL);
         if (now >= 0) {
             unsent_.erase(0, static_cast<std::size_t>(now));
         } else if (errno == EAGAIN) {
@@ -149,21 +164,21 @@ bool ChildProcess::SendRest() {
 
 bool ChildProcess::Receive(std::string& bytes) {
     const std::size_t before = bytes.size();
-    const bool isOpen = ReadSome(channel_, bytes);
+    const bool isOpen = ReadSome(ends_->channel, bytes);
     hasMore_ = isOpen && bytes.size() - before >= kPiece;
     return isOpen;
 }
 
 void ChildProcess::ReceiveErrors(std::string& text, std::size_t most) {
-    if (errors_ >= 0 && !ReadSome(errors_, text)) {
-        CloseIfOpen(errors_);
+    if (ends_->errors >= 0 && !ReadSome(ends_->errors, text)) {
+        CloseIfOpen(ends_->errors);
     }
     text.resize(std::min(text.size(), most));
 }
 
 std::size_t ChildProcess::PeakMemory() const {
     constexpr char kName[] = "VmHWM:";
-    std::ifstream status("/proc/" + std::to_string(process_) + "/status");
+    std::ifstream status("/proc/" + std::to_string(ends_->process) + "/status");
     for (std::string line; std::getline(status, line);) {
         if (line.compare(0, sizeof kName - 1, kName) == 0) {
             const std::size_t first = line.find_first_of("0123456789");
@@ -180,19 +195,17 @@ std::size_t ChildProcess::PeakMemory() const {
 
 ProcessEnd ChildProcess::End() {
     ProcessEnd end;
-    if (process_ > 0) {
-        kill(process_, SIGKILL);  // one that is ending already keeps the cause that it has
+    if (ends_) {
+        kill(ends_->process, SIGKILL);  // one that is ending already keeps the cause that it has
         int status = 0;
-        while (waitpid(process_, &status, 0) < 0 && errno == EINTR) {
+        while (waitpid(ends_->process, &status, 0) < 0 && errno == EINTR) {
         }
         end.signal = WIFSIGNALED(status) ? WTERMSIG(status) : 0;
         end.status = WIFEXITED(status) ? WEXITSTATUS(status) : 0;
     }
-    process_ = 0;
+    ends_.reset();
     unsent_.clear();
     hasMore_ = false;
-    CloseIfOpen(channel_);
-    CloseIfOpen(errors_);
     return end;
 }
 
@@ -201,8 +214,8 @@ void ChildProcess::WaitForAny(const std::vector<const ChildProcess*>& children,
     std::vector<pollfd> ends;
     for (const ChildProcess* const child : children) {
         const int room = child->unsent_.empty() ? 0 : POLLOUT;
-        ends.push_back({child->channel_, static_cast<short>(POLLIN | room), 0});
-        ends.push_back({child->errors_, POLLIN, 0});
+        ends.push_back({child->ends_->channel, static_cast<short>(POLLIN | room), 0});
+        ends.push_back({child->ends_->errors, POLLIN, 0});
     }
     poll(ends.data(), ends.size(), static_cast<int>(most.count()));
 }

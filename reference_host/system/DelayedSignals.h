@@ -2,7 +2,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <csignal>
 #include <vector>
 
 namespace host::system {
@@ -22,12 +21,11 @@ public:
 
     static bool HaveCome() { return Which() != 0; }
     static int Which();  // 0: none has come
+    // Whether it told that nobody reads what we write any more.
+    static bool ReaderHasGone();
 
 private:
-    struct Before {
-        int signal;
-        struct sigaction action;
-    };
+    struct Before;  // what was settled for a signal
     std::vector<Before> before_;
 };
 

@@ -6,6 +6,7 @@
 
 #include <atomic>
 #include <cerrno>
+#include <csignal>
 #include <cstring>
 #include <ctime>
 
@@ -51,6 +52,11 @@ extern "C" void NoteSignal(int signal) {
 
 }  // namespace
 
+struct DelayedSignals::Before {
+    int signal;
+    struct sigaction action;
+};
+
 DelayedSignals::DelayedSignals(const char* line) {
     if (objects++ > 0) {
         return;
@@ -91,6 +97,10 @@ DelayedSignals::~DelayedSignals() {
 
 int DelayedSignals::Which() {
     return noted;
+}
+
+bool DelayedSignals::ReaderHasGone() {
+    return noted == SIGPIPE;
 }
 
 }  // namespace host::system

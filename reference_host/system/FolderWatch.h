@@ -4,7 +4,7 @@
 
 #include <chrono>
 #include <filesystem>
-#include <map>
+#include <memory>
 #include <vector>
 
 namespace host::system {
@@ -25,7 +25,7 @@ struct FolderChange {
 // tell of what this machine does alone.
 class FolderWatch {
 public:
-    FolderWatch() = default;
+    FolderWatch();
     ~FolderWatch();
     FolderWatch(const FolderWatch&) = delete;
     FolderWatch& operator=(const FolderWatch&) = delete;
@@ -36,10 +36,9 @@ public:
     std::vector<FolderChange> Wait(std::chrono::milliseconds time);
 
 private:
-    void Take(const char* bytes, std::size_t size, std::vector<FolderChange>& changes);
+    struct Watched;  // the folders, as the system knows them
 
-    int descriptor_ = -1;
-    std::map<int, std::filesystem::path> folders_;  // by the system's numbers
+    std::unique_ptr<Watched> watched_;
 };
 
 }  // namespace host::system

@@ -24,6 +24,25 @@ std::u32string FromSystemPath(const std::filesystem::path& path);
 // The form that the module expects: every separator a backslash.
 std::u32string ToModulePath(const std::filesystem::path& path);
 
+// The text by which a path goes into arguments, documents and other libraries, and the path of such
+// a text: the name's bytes, or UTF-8 where the system's names are characters.
+std::string PathText(const std::filesystem::path& path);
+std::filesystem::path PathOfText(std::string_view text);
+// The same text with "/" between the names.
+std::string GenericPathText(const std::filesystem::path& path);
+
+// The file URL of an absolute path, and the text of the path that a URL names on this machine.
+// False, with `path` unchanged, for one that names none.
+std::string UrlOfPath(const std::filesystem::path& path);
+bool PathTextOfUrl(std::string_view url, std::string& path);
+
+// The path on this machine of what a URL says: the machine that it names, and the rooted path
+// there. Empty: it is of another machine.
+std::filesystem::path PathOfPlace(const std::string& machine, const std::string& path);
+
+// Why no file can be called so, though the system may not say it; empty: nothing is wrong.
+std::string NameProblem(const std::filesystem::path& path);
+
 // Whether a component holds a backslash of its own, so that the module's form
 // can't name it. Never on Windows.
 bool HoldsBackslash(const std::filesystem::path& path);

@@ -3,6 +3,8 @@
 #pragma once
 
 #include <filesystem>
+#include <string>
+#include <vector>
 
 namespace host::system {
 
@@ -10,6 +12,14 @@ namespace host::system {
 // streams that the caller closed stay closed, and a file that outgrows its limit or
 // a pipe that nobody reads any more fails to be written.
 void PrepareProcess();
+
+// The program's name, which may be empty, and its arguments, of which the system may know more than
+// main() is told: in UTF-8 where the system has them as characters, otherwise the bytes as they
+// are.
+std::vector<std::string> CommandLineWords(int argc, char** argv);
+
+// Where a user's settings lie; empty: nothing tells.
+std::filesystem::path SettingsFolder();
 
 // The file that runs. `name` is what the caller called it.
 std::filesystem::path ProgramFile(const char* name);

@@ -3,7 +3,9 @@
 #include <fcntl.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <csignal>
+#include <cstdlib>
 #include <system_error>
 
 #include "reference_host/system/Process.h"
@@ -22,6 +24,25 @@ void PrepareProcess() {
             open("/dev/null", stream == STDERR_FILENO ? O_WRONLY : O_RDONLY);
         }
     }
+}
+
+std::vector<std::string> CommandLineWords(int argc, char** argv) {
+    std::vector<std::string> words(argv, argv + argc);
+    words.resize(std::max<std::size_t>(words.size(), 1));
+    return words;
+}
+
+std::filesystem::path SettingsFolder() {
+    const auto folder = [](const char* variable) {
+        const char* const value = std::getenv(variable);
+        const std::filesystem::path path = value ? value : "";
+        return path.is_absolute() ? path : std::filesystem::path();
+    };
+    if (auto own = folder("XDG_CONFIG_HOME"); !own.empty()) {
+        return own;
+    }
+    const auto home = folder("HOME");
+    return home.empty() ? home : home / ".config";
 }
 
 std::filesystem::path ProgramFile(const char* name) {

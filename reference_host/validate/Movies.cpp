@@ -6,6 +6,7 @@
 #include <cerrno>
 #include <fstream>
 
+#include "reference_host/system/Paths.h"
 #include "reference_host/validate/Trial.h"
 
 namespace validate {
@@ -192,7 +193,8 @@ std::vector<SampleMovie> WriteOddlyNamedMovies(const std::filesystem::path& fold
     };
     std::vector<SampleMovie> written;
     for (const std::string& name : names) {
-        written.push_back(Write(WholeMovie(), folder / name, "a sound movie under an odd name"));
+        written.push_back(Write(WholeMovie(), folder / host::system::PathOfText(name),
+                                "a sound movie under an odd name"));
     }
     return written;
 }

@@ -90,7 +90,8 @@ Outcome Run(const Check& check, const TrialOptions& options, const Trial::Tell& 
         end({Verdict::kSkipped,
              {},
              "the checker can't write " + host::DisplayPath(failure.path) + ": " +
-                 failure.error.message() + "; name another folder in TMPDIR",
+                 failure.error.default_error_condition().message() +
+                 "; name another folder in TMPDIR",
              {}});
     } catch (NCFRESULT result) {
         thrown(options.resultText(result));

@@ -24,7 +24,7 @@ NCFRESULT Inspect(const std::filesystem::path& file, std::string& problem) {
         return NCF_E_NOTFOUND;
     }
     if (status.type() != std::filesystem::file_type::regular) {
-        problem = failure                                                  ? failure.message()
+        problem = failure ? failure.default_error_condition().message()
                   : status.type() == std::filesystem::file_type::directory ? "this is a folder"
                                                                            : "this is no file";
         return NCF_E_HANDLE;

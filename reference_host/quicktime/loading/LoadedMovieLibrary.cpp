@@ -6,6 +6,7 @@
 
 #include "host_interfaces/util/NMAUtil.h"
 #include "reference_host/quicktime/loading/MovieLibrary.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/SharedLibrary.h"
 
 namespace host {
@@ -27,7 +28,7 @@ Loading Load() {
     }
     auto* const get = reinterpret_cast<GetMovieLibrary*>(shared.Find(kGetMovieLibrary));
     if (get == nullptr) {
-        loading.problem = file.string() + " is not the library of this program";
+        loading.problem = system::PathText(file) + " is not the library of this program";
         return loading;
     }
     loading.library = get();

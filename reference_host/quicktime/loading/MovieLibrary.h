@@ -30,6 +30,10 @@ struct MovieLibrary {
 // The one function that it exports, and its name.
 using GetMovieLibrary = const MovieLibrary*();
 inline constexpr char kGetMovieLibrary[] = "CliphostMovieLibrary";
+#ifdef _WIN32
+inline constexpr char kMovieLibraryName[] = "cliphost-movies.dll";
+#else
 inline constexpr char kMovieLibraryName[] = "libcliphost-movies.so";
+#endif
 
 }  // namespace host

@@ -9,7 +9,7 @@
 // Pictures come out of FFmpeg's threads, whose agreement this sanitizer can't
 // see: each byte read would be a report to suppress.
 #define VECTOR_KERNEL __attribute__((no_sanitize("thread")))
-#elif defined(__x86_64__) && defined(__GNUC__) && !defined(__clang__) && \
+#elif defined(__x86_64__) && defined(__ELF__) && defined(__GNUC__) && !defined(__clang__) && \
     !defined(__SANITIZE_ADDRESS__)
 #define VECTOR_KERNEL __attribute__((target_clones("arch=x86-64-v4", "avx2", "default")))
 #else

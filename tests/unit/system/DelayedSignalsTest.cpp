@@ -3,8 +3,10 @@
 #include "reference_host/system/DelayedSignals.h"
 
 #include <gtest/gtest.h>
+
 #include <sys/wait.h>
 #include <unistd.h>
+#include <csignal>
 
 #include <chrono>
 #include <functional>

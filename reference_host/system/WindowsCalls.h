@@ -1,0 +1,69 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <windows.h>
+
+#include <filesystem>
+#include <string>
+#include <utility>
+
+// What the Windows halves share.
+namespace host::system {
+
+// Closes a handle of the system.
+class OwnedHandle {
+public:
+    explicit OwnedHandle(HANDLE handle = nullptr) : handle_(handle) {}
+    ~OwnedHandle() { Close(); }
+    OwnedHandle(OwnedHandle&& other) noexcept : handle_(std::exchange(other.handle_, nullptr)) {}
+    OwnedHandle& operator=(OwnedHandle&& other) noexcept {
+        std::swap(handle_, other.handle_);
+        return *this;
+    }
+
+    bool IsOpen() const { return handle_ != nullptr && handle_ != INVALID_HANDLE_VALUE; }
+    HANDLE get() const { return handle_; }
+    HANDLE Release() { return std::exchange(handle_, nullptr); }
+    void Close() {
+        if (IsOpen()) {
+            CloseHandle(handle_);
+        }
+        handle_ = nullptr;
+    }
+
+private:
+    HANDLE handle_;
+};
+
+// The C library's number for an error of the system, by which the host tells errors apart.
+int ErrorNumber(DWORD error);
+inline int LastErrorNumber() {
+    return ErrorNumber(GetLastError());
+}
+
+// What the system says of an error, in UTF-8.
+std::string ErrorWords(DWORD error);
+
+// A file or folder that is there, opened beside others who read, write or remove it.
+OwnedHandle OpenThere(const std::filesystem::path& path, DWORD access);
+
+// Set from when a signal has come until it is waited for anew.
+HANDLE SignalEvent();
+
+// Calls that fill a buffer with a text and want a larger one where it does not fit: `fill` is given
+// buffer and size, and gives the length.
+template <class Fill>
+std::wstring TextOf(const Fill& fill) {
+    std::wstring text(MAX_PATH, L'\0');
+    for (;;) {
+        const DWORD length = fill(text.data(), static_cast<DWORD>(text.size()));
+        if (length < text.size()) {
+            text.resize(length);
+            return text;
+        }
+        text.resize(text.size() * 2);
+    }
+}
+
+}  // namespace host::system

@@ -1,0 +1,44 @@
+// Copyright (c) 2026 The Cliphost authors
+// SPDX-License-Identifier: MIT
+#include "reference_host/system/WindowsCalls.h"
+
+#include <cerrno>
+#include <system_error>
+
+#include "text/Encodings.h"
+
+namespace host::system {
+
+int ErrorNumber(DWORD error) {
+    if (error == ERROR_NO_DATA || error == ERROR_BROKEN_PIPE) {
+        return EPIPE;
+    }
+    const std::error_condition plain =
+        std::system_category().default_error_condition(static_cast<int>(error));
+    return plain.category() == std::generic_category() ? plain.value() : EIO;
+}
+
+std::string ErrorWords(DWORD error) {
+    wchar_t words[1024];
+    DWORD length = FormatMessageW(FORMAT_MESSAGE_FROM_SYSTEM | FORMAT_MESSAGE_IGNORE_INSERTS,
+                                  nullptr, error, 0, words, 1024, nullptr);
+    while (length > 0 && (words[length - 1] <= L' ' || words[length - 1] == L'.')) {
+        --length;
+    }
+    return length == 0 ? "error " + std::to_string(error)
+                       : encodings::ToUtf8Lossy(encodings::FromWide({words, length}));
+}
+
+OwnedHandle OpenThere(const std::filesystem::path& path, DWORD access) {
+    // The flag opens folders, too.
+    return OwnedHandle(CreateFileW(path.c_str(), access,
+                                   FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE, nullptr,
+                                   OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr));
+}
+
+HANDLE SignalEvent() {
+    static const HANDLE event = CreateEventW(nullptr, TRUE, FALSE, nullptr);
+    return event;
+}
+
+}  // namespace host::system
