@@ -14,6 +14,39 @@ ELEMENT = '<script type="application/json" id="%s">'
 END = "</script>\n"
 
 
+def ratio(clip):
+    numerator, denominator = clip["rate"].split("/")
+    return int(numerator) / int(denominator)
+
+
+def sound(clip):
+    name = clip.get("soundName") or clip.get("soundCodec") or "sound"
+    rate = f", {clip['soundRate'] / 1000:g}\u00a0kHz" if clip.get("soundRate") else ""
+    return f"{name}, {clip['channels']}\u00a0ch{rate}"
+
+
+# What a column of the table goes by; nothing for a clip that has none.
+COLUMNS = {
+    "name": lambda clip: clip["name"],
+    "length": lambda clip: clip.get("seconds"),
+    "start": lambda clip: clip.get("start") if clip.get("hasTimecode", True) else None,
+    "rate": lambda clip: ratio(clip) if "rate" in clip else None,
+    "raster": lambda clip: clip["width"] * clip["height"] if "width" in clip else None,
+    "codec": lambda clip: clip.get("codecName") or clip.get("codec"),
+    "sound": lambda clip: sound(clip) if clip.get("channels") else None,
+    "size": lambda clip: clip.get("size"),
+    "date": lambda clip: clip.get("date"),
+    "warnings": lambda clip: len(clip["warnings"]) + len(clip["traits"]) / 100,
+}
+
+# What clips of a group have in common.
+GROUPINGS = {
+    "folder": lambda clip: clip["folder"],
+    "codec": lambda clip: COLUMNS["codec"](clip) or "No picture",
+    "rate": lambda clip: f"{round(ratio(clip), 3):g}\u00a0fps" if "rate" in clip else "No rate",
+}
+
+
 def make_movies(made, folder):
     """Movies under ordinary and hostile names; one that is none."""
     for name in ("h264_with_aac", "timecode_25", "timecode_2997_drop", "rotated_270", "prores_hq_1080i", "three_sounds"):
