@@ -1,7 +1,8 @@
 #!/usr/bin/env bash
 # Builds for 64-bit Windows what the program links, out of the sources of Debian's packages, and prints the
 # folder where it lies. A machine does that once: the folder's name tells the recipe, the compiler, and the
-# versions that Linux has. Of apt it has lists of its own, so the machine's stay as they are.
+# versions that Linux has. Of apt it has lists of its own, so the machine's stay as they are. Exit status: 3, the
+# sources can't be fetched; 1, anything else.
 set -Eeuo pipefail
 
 release=bookworm
@@ -108,12 +109,15 @@ fetch() { # apt's own lists, keys and cache, and what they name
                  -o Dir::Etc::sourcelist="$work/apt/sources.list" -o Dir::Etc::sourceparts=-
                  -o Dir::Etc::preferencesparts=- -o APT::Sandbox::User= -o Acquire::Retries=3)
   cd "$work/source"
-  apt-get "${options[@]}" update
+  apt-get "${options[@]}" update >log 2>&1 || true # what lacks then is told below
   local source
   for source in dav1d "${sources[@]}"; do # the release's own, where a mirror has no security updates
     apt-get "${options[@]}" --only-source source "$source" >>log 2>&1 \
       || apt-get "${options[@]}" --only-source source "$source/$release" >>log 2>&1 \
-      || { tail -n 40 log >&2; return 1; }
+      || { tail -n 20 log >&2
+           printf 'windows_libraries: Debian %s has no source package %s at http://deb.debian.org that can be fetched\n' \
+             $release "$source" >&2
+           exit 3; }
   done
 }
 
