@@ -35,13 +35,7 @@ class Tally : public testing::EmptyTestEventListener {
     }
 };
 
-#ifdef _WIN32
-void setenv(const char* name, const char* value, int) {
-    _putenv_s(name, value);
-}
-#endif
-
-int program = 0;
+pid_t program = 0;
 bool isOver = false;
 
 void FailWhenATestExits() {
