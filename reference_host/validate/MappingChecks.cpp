@@ -108,7 +108,27 @@ void RefusesOtherTracks(Trial& trial) {
         trial.ExpectRefusal(mapping->GetNumberOfSamples(track, &number));
         trial.ExpectRefusal(mapping->GetSamplePosition(track, 0, &number));
         trial.ExpectRefusal(mapping->GetSampleSize(track, 0, &number));
+        ncfUInt32 count = 0;
+        trial.ExpectRefusal(mapping->GetNumberOfChannels(track, &count));
+        trial.ExpectRefusal(mapping->GetSampleProperties(track, 0, &number, &count));
+        ncfSInt64 offset = 0;
+        trial.ExpectRefusal(mapping->GetSampleTemporalOffset(track, 0, &offset));
     }
+}
+
+void MappingRefusesNull(Trial& trial) {
+    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64,
+                            std::uintmax_t) {
+        trial.Doing("asking about track " + std::to_string(track) + " with null for the output");
+        trial.ExpectRefusal(mapping.GetNumberOfChannels(track, nullptr));
+        trial.ExpectRefusal(mapping.GetNumberOfSamples(track, nullptr));
+        trial.ExpectRefusal(mapping.GetSampleSize(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetSamplePosition(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetSampleTemporalOffset(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetSampleProperties(track, 0, nullptr, nullptr));
+        trial.ExpectRefusal(mapping.GetNumberOfContiguousSamples(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetNumberOfContiguousBytes(track, 0, nullptr));
+    });
 }
 
 void RefusesOtherSamples(Trial& trial) {
@@ -152,6 +172,8 @@ std::vector<Check> MappingChecks() {
         {"mapping-other-samples",
          "For a sample beyond the last, a mapping names no place outside of the file.",
          "the number is not compared", RefusesOtherSamples},
+        {"mapping-null-outputs", "A mapping refuses null for an output.",
+         "the output is used before it is looked at", MappingRefusesNull},
         {"mapping-outlives",
          "A mapping goes on when its container is released, and counts as "
          "alive.",

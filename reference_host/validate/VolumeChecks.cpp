@@ -42,6 +42,49 @@ void LeavesOtherFolders(Trial& trial) {
     trial.Expect(!volumes.Claims(volumes.movies()[0].file), "0", "1");
 }
 
+void VolumeRefusesNullPaths(Trial& trial, NMA::IMediaVolume& volume) {
+    trial.Doing("calling IsMediaVolume with null for the path");
+    trial.ExpectResult(0, volume.IsMediaVolume(nullptr), "0, whatever happens");
+    trial.Doing("calling GetVolumeInfo with null for the path");
+    host::Ref<NMA::IVolumeInfo> info;
+    trial.ExpectRefusal(volume.GetVolumeInfo(nullptr, info.Out()));
+    trial.Doing("calling GetMediaFormat with null for the path");
+    host::Ref<NMA::IMediaFormat> format;
+    trial.ExpectRefusal(volume.GetMediaFormat(nullptr, format.Out()));
+}
+
+void VolumeRefusesNullOutputs(Trial& trial, Volumes& volumes) {
+    const auto path = host::ModulePath(volumes.folder());
+    NMA::IMediaVolume& volume = *volumes.volume();
+    trial.Doing("calling GetVolumeInfo with null for the output");
+    trial.ExpectRefusal(volume.GetVolumeInfo(path.get(), nullptr));
+    trial.Doing("calling GetMediaFormat with null for the output");
+    trial.ExpectRefusal(volume.GetMediaFormat(path.get(), nullptr));
+    trial.Doing("calling GetContainerComponentId with null for the output");
+    trial.ExpectRefusal(volume.GetContainerComponentId(nullptr));
+    host::Ref<NMA::IVolumeInfo> info;
+    trial.ExpectSuccess(volume.GetVolumeInfo(path.get(), info.Out()));
+    trial.Doing("asking a volume for type, serial number, label and date with null for the output");
+    trial.ExpectRefusal(info->GetType(nullptr));
+    trial.ExpectRefusal(info->GetSerialNumber(nullptr));
+    trial.ExpectRefusal(info->GetLabel(nullptr));
+    trial.ExpectRefusal(info->GetModificationDate(nullptr));
+    host::Ref<NMA::IMediaFormat> format;
+    trial.ExpectSuccess(volume.GetMediaFormat(path.get(), format.Out()));
+    trial.Doing("asking a folder's format for its clips with null for the output");
+    trial.ExpectRefusal(format->GetAAFClips(nullptr));
+    const auto clips = volumes.ClipsOf(volumes.folder());
+    trial.Doing("asking a folder's list for path and description with null for the output");
+    trial.ExpectRefusal(clips->GetClipPath(0, nullptr));
+    trial.ExpectRefusal(clips->GetMetadata(0, nullptr));
+}
+
+void VolumeRefusesNull(Trial& trial) {
+    Volumes volumes(trial);
+    VolumeRefusesNullPaths(trial, *volumes.volume());
+    VolumeRefusesNullOutputs(trial, volumes);
+}
+
 void TellsOfAFolder(Trial& trial) {
     Volumes volumes(trial);
     trial.Doing("calling GetVolumeInfo with a folder of movies");
@@ -191,6 +234,9 @@ std::vector<Check> VolumeChecks() {
          "A volume answers 0 for an empty folder, for one that is not there and for a file.",
          "a failure is handed on instead of 0, or the folder is not looked into",
          LeavesOtherFolders},
+        {"volume-null-arguments",
+         "A volume and what it hands out refuse null for a path and for an output.",
+         "the argument is used before it is looked at", VolumeRefusesNull},
         {"volume-info",
          "A claimed folder has a volume info with type, serial number, label and date.",
          "an output is left as it was", TellsOfAFolder},

@@ -67,12 +67,15 @@ constexpr Row kRows[] = {
     {"order-registration-after-start"},
     {"order-start-without-registration"},
     {"order-factory-not-started", "crashed"},
+    {"order-creation-not-started", "crashed"},
     {"order-start-twice"},
     {"order-shutdown-twice", "crashed"},
     {"order-start-again"},
     {"order-shutdown-with-objects", "crashed"},
     {"order-other-thread"},
     {"order-registration-on-two-threads"},
+    {"order-plugin-registration-on-two-threads"},
+    {"order-unload-question-on-two-threads"},
     {"order-creation-on-threads"},
     {"order-no-thread"},
     {"plugin-definition"},
@@ -105,6 +108,7 @@ constexpr Row kRows[] = {
     {"factory-interfaces"},
     {"factory-kept"},
     {"factory-refuses-unloading"},
+    {"factory-counted-each"},
     {"factory-released-first"},
     {"create-null-host", "crashed"},
     {"create-null-output"},
@@ -124,6 +128,7 @@ constexpr Row kRows[] = {
     {"counts-end"},
     {"counts-on-threads"},
     {"objects-many"},
+    {"objects-locks"},
     {"unload-null-host"},
     {"unload-refused"},
     {"unload-allowed"},
@@ -135,6 +140,7 @@ constexpr Row kRows[] = {
     {"volume-claims"},
     {"volume-claims-again"},
     {"volume-other-folders"},
+    {"volume-null-arguments"},
     {"volume-info"},
     {"volume-format"},
     {"volume-clip-paths"},
@@ -150,6 +156,8 @@ constexpr Row kRows[] = {
     {"container-path-once"},
     {"container-path-copied"},
     {"container-without-path"},
+    {"container-null-arguments"},
+    {"container-locks"},
     {"container-missing-file"},
     {"container-supports"},
     {"container-describes-again"},
@@ -173,6 +181,7 @@ constexpr Row kRows[] = {
     {"mapping-in-file"},
     {"mapping-other-tracks"},
     {"mapping-other-samples"},
+    {"mapping-null-outputs"},
     {"mapping-outlives"},
     {"files-broken", "crashed"},
     {"files-hostile", "timedOut"},
@@ -184,6 +193,8 @@ constexpr Row kRows[] = {
     {"leaks-objects"},
     {"leaks-refused-creation"},
     {"leaks-descriptions"},
+    {"leaks-mappings"},
+    {"leaks-volumes"},
     {"leaks-broken-files"},
     {"fuzz-calls", "crashed"},
     {"fuzz-movies", "crashed"},
@@ -286,7 +297,7 @@ TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
             media += id.rfind(group, 0) == 0 ? 1 : 0;
         }
     }
-    media += 3;  // leaks-descriptions, leaks-broken-files, fuzz-movies
+    media += 5;  // leaks-descriptions, -mappings, -volumes, -broken-files, fuzz-movies
     EXPECT_EQ(counts["skipped"], media);
     EXPECT_EQ(counts["passed"], std::size(kRows) - media);
 }
@@ -415,6 +426,17 @@ TEST_F(Validates, AndWarnsWhereCallsHaveNoEnd) {
     EXPECT_EQ(answer.status, 0);
     const json check = answer.Of("refusal-definition-calls");
     EXPECT_EQ(check["verdict"], "warning") << check.dump(2);
+    EXPECT_EQ(check["found"], "there are more, which were not refused");
+}
+
+TEST_F(Validates, AndWarnsWhereQueriesHaveNoEnd) {
+    setenv("CLIPHOST_FAULT", "queries-without-end", 1);
+    const Answer answer =
+        Validate(Faulty("FaultyModule"), "--only refusal-query --limit-seconds 100000");
+    EXPECT_EQ(answer.status, 0);
+    const json check = answer.Of("refusal-query");
+    EXPECT_EQ(check["verdict"], "warning") << check.dump(2);
+    EXPECT_EQ(check["expected"], "no more than 5000 calls of the host");
     EXPECT_EQ(check["found"], "there are more, which were not refused");
 }
 
