@@ -287,8 +287,9 @@ TEST_F(Validates, AndPassesThePlugin) {
     EXPECT_EQ(CountsOf(kOurs)["passed"], std::size(kRows));
 }
 
-TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
-    const json counts = CountsOf(kMinimal);
+// Modules of objects that can't be aggregated, and without media.
+void ExpectMediaAreSkipped(const std::filesystem::path& module) {
+    const json counts = CountsOf(module);
     std::size_t media = 2;  // it makes objects that can't be aggregated
     for (const Row& row : kRows) {
         const std::string id = row.id;
@@ -300,6 +301,14 @@ TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
     media += 5;  // leaks-descriptions, -mappings, -volumes, -broken-files, fuzz-movies
     EXPECT_EQ(counts["skipped"], media);
     EXPECT_EQ(counts["passed"], std::size(kRows) - media);
+}
+
+TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
+    ExpectMediaAreSkipped(kMinimal);
+}
+
+TEST_F(Validates, AndPassesTheTinyModuleOfTheUnitTests) {
+    ExpectMediaAreSkipped(Faulty("tiny_file_none"));
 }
 
 TEST_F(Validates, AFileThatIsNoModuleByOneCheckAndSkipsTheRest) {
