@@ -144,6 +144,39 @@ void RefusesOtherSamples(Trial& trial) {
     });
 }
 
+void MappingRefused(Trial& trial, Refused refused) {
+    Containers containers(trial);
+    const SampleMovie movie = WriteSoundMovie(trial.folder());
+    MappingOf(containers, movie.file);
+    RefuseEach(
+        containers.module(), refused,
+        [&](int number) {
+            trial.Doing(std::string("asking for a movie's sample mapping while the host refuses ") +
+                        WordOf(refused) + " " + std::to_string(number));
+        },
+        [&] {
+            const auto container = containers.TryToOpen(movie.file);
+            host::Ref<NMA::ISampleMapping> mapping;
+            const NCFRESULT result =
+                container ? container->GetSampleMapping(mapping.Out()) : NCF_E_FAIL;
+            trial.Expect((result >= 0) == static_cast<bool>(mapping),
+                         "a mapping with success, or null with a failure",
+                         trial.Text(result) + (mapping ? ", and a mapping" : ", and null"));
+        });
+    trial.Doing("asking for a movie's sample mapping after the host has refused something");
+    host::Ref<NMA::ISampleMapping> mapping;
+    trial.ExpectSuccess(containers.Open(movie.file)->GetSampleMapping(mapping.Out()),
+                        "success, as before the refusals");
+}
+
+void CreationsRefusedInMapping(Trial& trial) {
+    MappingRefused(trial, Refused::kCreations);
+}
+
+void QueriesRefusedInMapping(Trial& trial) {
+    MappingRefused(trial, Refused::kQueries);
+}
+
 void MappingOutlivesTheContainer(Trial& trial) {
     Containers containers(trial);
     auto container = containers.Open(WriteSoundMovie(trial.folder()).file);
@@ -160,6 +193,8 @@ void MappingOutlivesTheContainer(Trial& trial) {
 }  // namespace
 
 std::vector<Check> MappingChecks() {
+    static constexpr char kRefusal[] =
+        "a result is not looked at, or the output is set although a later step fails";
     return {
         {"mapping-tracks", "A movie with picture and sound has tracks in its sample mapping.",
          "the answer is a result instead of the number", HasTracks},
@@ -174,6 +209,14 @@ std::vector<Check> MappingChecks() {
          "the number is not compared", RefusesOtherSamples},
         {"mapping-null-outputs", "A mapping refuses null for an output.",
          "the output is used before it is looked at", MappingRefusesNull},
+        {"mapping-creations-refused",
+         "When the host refuses to make the n-th component that a sample mapping asks for, for "
+         "every n, it is made or refused, and the next one works.",
+         kRefusal, CreationsRefusedInMapping},
+        {"mapping-queries-refused",
+         "When the host refuses the n-th interface that a sample mapping asks for, for every n, "
+         "it is made or refused, and the next one works.",
+         kRefusal, QueriesRefusedInMapping},
         {"mapping-outlives",
          "A mapping goes on when its container is released, and counts as "
          "alive.",

@@ -211,6 +211,48 @@ void GoesOnWithBadFiles(Trial& trial) {
     }
 }
 
+// Lists a folder as far as the host lets the module.
+void ListAnyway(Trial& trial, Volumes& volumes) {
+    const auto path = host::ModulePath(volumes.folder());
+    volumes.Claims(volumes.folder());
+    host::Ref<NMA::IVolumeInfo> info;
+    const bool hasInfo = volumes.volume()->GetVolumeInfo(path.get(), info.Out()) >= 0;
+    trial.Expect(!hasInfo || info, "an info with success", "null");
+    host::Ref<INCFString> label;
+    const bool hasLabel = hasInfo && info->GetLabel(label.Out()) >= 0;
+    trial.Expect(!hasLabel || label, "a label with success", "null");
+    host::Ref<NMA::IMediaFormat> format;
+    const bool hasFormat = volumes.volume()->GetMediaFormat(path.get(), format.Out()) >= 0;
+    trial.Expect(!hasFormat || format, "a format with success", "null");
+    host::Ref<NMA::IAAFClips> clips;
+    const bool hasClips = hasFormat && format->GetAAFClips(clips.Out()) >= 0;
+    trial.Expect(!hasClips || clips, "a list with success", "null");
+}
+
+void ListingRefused(Trial& trial, Refused refused) {
+    Volumes volumes(trial);
+    const ncfSInt32 before = volumes.ClipsOf(volumes.folder())->GetCount();
+    RefuseEach(
+        volumes.module(), refused,
+        [&](int number) {
+            trial.Doing(std::string("listing a folder while the host refuses ") + WordOf(refused) +
+                        " " + std::to_string(number));
+        },
+        [&] { ListAnyway(trial, volumes); });
+    trial.Doing("listing a folder after the host has refused something");
+    trial.Expect(volumes.Claims(volumes.folder()), "1, as before the refusals", "0");
+    const ncfSInt32 after = volumes.ClipsOf(volumes.folder())->GetCount();
+    trial.Expect(after == before, "as many clips as before the refusals", std::to_string(after));
+}
+
+void CreationsRefusedInListing(Trial& trial) {
+    ListingRefused(trial, Refused::kCreations);
+}
+
+void QueriesRefusedInListing(Trial& trial) {
+    ListingRefused(trial, Refused::kQueries);
+}
+
 void ListOutlivesVolume(Trial& trial) {
     Volumes volumes(trial);
     const auto clips = volumes.ClipsOf(volumes.folder());
@@ -258,6 +300,14 @@ std::vector<Check> VolumeChecks() {
          "A folder with broken and hostile files is listed, and each of them refused or "
          "described.",
          "what stands in a file is used before it is looked at", GoesOnWithBadFiles},
+        {"volume-creations-refused",
+         "When the host refuses to make the n-th component that listing a folder asks for, for "
+         "every n, the folder is listed or refused, and the next one works.",
+         kPair, CreationsRefusedInListing},
+        {"volume-queries-refused",
+         "When the host refuses the n-th interface that listing a folder asks for, for every n, "
+         "the folder is listed or refused, and the next one works.",
+         kPair, QueriesRefusedInListing},
         {"volume-released-first", "A folder's list goes on when its volume is released.",
          "the list points into the volume or the format", ListOutlivesVolume},
     };

@@ -57,6 +57,9 @@ NCFRESULT GiveText(INCFUnknown* host, const char* text, INCFString** out) {
         return NCF_OK;
     }
     *out = Service<INCFString>(host, NCFCompID_NCFString);
+    if (*out == nullptr && (Is("volume-creations-refused") || Is("volume-queries-refused"))) {
+        Crash();
+    }
     return *out == nullptr ? NCF_E_OUTOFMEMORY
                            : (*out)->AssignUTF8(kNCFUTF16, text, kNCFZeroTerminated);
 }
@@ -253,6 +256,13 @@ public:
         if (Is("leaks-mappings")) {
             Leak();
         }
+        INCFLock* const lock = Service<INCFLock>(host_.get(), CompID_LockComponent);
+        if (lock == nullptr) {
+            return Is("mapping-creations-refused") || Is("mapping-queries-refused")
+                       ? NCF_OK
+                       : NCF_E_OUTOFMEMORY;
+        }
+        lock->Release();
         auto* const made = new Mapping;
         *mapping = made;
         if (Is("mapping-outlives")) {
