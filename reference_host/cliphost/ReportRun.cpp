@@ -187,6 +187,9 @@ std::optional<catalog::Entry> ReportRun::EntryInCatalogs(const std::filesystem::
 }
 
 void ReportRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    if (notWritten_) {
+        throw Failure(*notWritten_);
+    }
     std::error_code ignored;
     if (std::filesystem::is_directory(movie, ignored)) {
         return;  // of movies, there are none in it
@@ -232,10 +235,19 @@ void ReportRun::Add(const std::filesystem::path& movie, Json clip, bool hasFaile
     if (options_.json) {
         facts["details"] = std::move(details);
     } else {
-        TakePictures(facts, details);
-        page_->AddClip(clips_.size(), Dumped(details));
+        Write(facts, details);
     }
     clips_.push_back(std::move(facts));
+}
+
+void ReportRun::Write(Json& facts, Json& details) {
+    try {
+        TakePictures(facts, details);
+        page_->AddClip(clips_.size(), Dumped(details));
+    } catch (const Failure& failure) {
+        notWritten_ = failure;
+        throw;
+    }
 }
 
 void ReportRun::TakePictures(Json& facts, Json& details) {

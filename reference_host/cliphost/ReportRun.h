@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "reference_host/catalog/Catalog.h"
+#include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/MovieCodecs.h"
 #include "reference_host/cliphost/MoviesRun.h"
 #include "reference_host/cliphost/OutputFile.h"
@@ -58,12 +59,14 @@ private:
     void ShowFailure(const std::filesystem::path& movie, const Problem& problem) override;
     bool Collects() const override { return false; }
     bool LooksFirst() const override { return true; }
+    bool TellsFailures() const override { return !notWritten_; }
     void Finish(int read, int failed) override;
 
     void RefuseCatalogsOfList(const MoviePlan& plan);
     std::optional<catalog::Entry> EntryInCatalogs(const std::filesystem::path& movie);
     void AddFile(const std::filesystem::path& movie, Json& facts);
     void Add(const std::filesystem::path& movie, Json clip, bool hasFailed);
+    void Write(Json& facts, Json& details);
     // Into the folder beside the page, where there is one.
     void TakePictures(Json& facts, Json& details);
     void WritePage();
@@ -76,6 +79,7 @@ private:
     std::optional<ReportFolder> pictures_;  // none: they are in the page
     std::optional<OutputFile> output_;
     std::optional<report::Page> page_;
+    std::optional<Failure> notWritten_;  // page or pictures; no movie's fault, and ends the run
     std::uint64_t written_ = 0;
     Json clips_ = Json::array();  // without details where they are in the page already
 };

@@ -588,6 +588,21 @@ TEST_F(Reports, RefuseCallsThatCanNotBeMeant) {
     EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
 }
 
+// The page's beginning is shorter than that, and the first clip is not.
+TEST_F(Reports, EndWithTheFirstClipThatCanNotBeWritten) {
+    Copy("h264_with_aac.mov", "in/a.mov");
+    Copy("h264_with_aac.mov", "in/b.mov");
+    for (const char* const options : {"", " --split", " --jobs 2", " --split --jobs 2"}) {
+        SCOPED_TRACE(options);
+        const CommandResult ran = RunCommand("ulimit -f 40; cd " + Quoted(folder()) + " && " +
+                                             Quoted(ProgramFolder() / "cliphost") +
+                                             " report in -o r.html" + options + " 2>&1");
+        ExpectSays(ran, 2, "not written: File too large");
+        EXPECT_EQ(ran.out.find("not written"), ran.out.rfind("not written")) << ran.out;
+        EXPECT_EQ(FilesIn("."), std::set<std::string>{"in"});
+    }
+}
+
 TEST_F(Reports, TakeThePlaceOfNoMovieThatIsRead) {
     Copy("pcm_u8.mov", "in/a.mov");
     Copy("pcm_u8.mov", "in/b.mov");
