@@ -7,6 +7,7 @@ Opens reports in Chromium and does what people do there. WORK is a folder that s
 Ends with status 77 where there is no browser.
 """
 
+import collections
 import shutil
 import subprocess
 import sys
@@ -142,14 +143,17 @@ class ReportInBrowser(unittest.TestCase):
         self.assertEqual(len(self.names()), self.count)
         self.assertEqual(self.page.all('.chip[aria-pressed="true"]'), [])
 
-    def test_groups_by_folder(self):
+    def test_groups_by_folder_codec_and_rate(self):
         self.open(height=3000)
-        self.page.run("const by = document.querySelector('#group'); by.value = 'folder';"
-                      "by.dispatchEvent(new Event('change'))")
-        self.page.frame()
-        groups = self.page.texts("tr.group bdi")
-        self.assertEqual([Path(group).name for group in groups], ["day 1", "day 2"])
-        self.assertEqual(len(self.names()), self.count)
+        clips = pages.document(self.report.read_text(encoding="utf-8"))["clips"]
+        for grouping, of in pages.GROUPINGS.items():
+            self.page.run("const by = document.querySelector('#group'); by.value = arguments[0];"
+                          "by.dispatchEvent(new Event('change'))", grouping)
+            self.page.frame()
+            told = dict(zip(self.page.texts("tr.group bdi"), self.page.texts("tr.group .count")))
+            counts = collections.Counter(of(clip) for clip in clips)
+            self.assertEqual({group: int(count.split("\u00a0")[0]) for group, count in told.items()}, counts)
+            self.assertEqual(len(self.names()), self.count)
 
     def test_opens_a_clip_and_comes_back_to_it(self):
         self.open()

@@ -39,6 +39,13 @@ COLUMNS = {
     "warnings": lambda clip: len(clip["warnings"]) + len(clip["traits"]) / 100,
 }
 
+# What clips of a group have in common.
+GROUPINGS = {
+    "folder": lambda clip: clip["folder"],
+    "codec": lambda clip: COLUMNS["codec"](clip) or "No picture",
+    "rate": lambda clip: f"{round(ratio(clip), 3):g}\u00a0fps" if "rate" in clip else "No rate",
+}
+
 
 def make_movies(made, folder):
     """Movies under ordinary and hostile names; one that is none."""
