@@ -19,17 +19,17 @@ grep -rhoE '/usr/share/common-licenses/[A-Za-z0-9.-]*[A-Za-z0-9]' licences | sor
 
 # --- what lies there, and what it asks of Windows ---------------------------------
 # The lists name a file in each row; behind a colon the libraries that it may import.
-listed() { sed '/^#/d; s/:.*//' "$contents" | sort; }
+listed() { sed '/^#/d; /^$/d; s/:.*//' "$contents" | sort; }
 there() { find . -type f -printf '%P\n' | sort; }
 difference=$(diff <(listed) <(there)) || fail "other files lie there (>) than are listed (<):
 $difference"
 
 imports() { $objdump -p "$1" | sed -n 's/.*DLL Name: //p' | sort -u; }
-exports() { $objdump -p "$1" | sed -n '/^\[Ordinal\/Name Pointer\]/,/^$/s/.*\] //p' | sort; }
+exports() { $objdump -p "$1" | sed -n '/^\[Ordinal\/Name Pointer\]/,/^$/s/^\t\[ *[0-9]*\] //p' | sort; }
 while IFS=: read -r file allowed; do
   more=$(comm -13 <(tr ' ' '\n' <<<"$allowed" | sort) <(imports "$file"))
   [ -z "$more" ] || fail "$file imports what its list lacks:" $more
-done < <(grep ': ' "$contents")
+done < <(grep '^[^#].*: ' "$contents")
 
 wanted=$(sed -n 's/^ *\(NCF[A-Za-z]*\);$/\1/p' "${contents%/cmake/*}/source/plugin/entry/exports.map" | sort)
 [ "$(exports plugins/QuickTimePlugin.nvx)" = "$wanted" ] \

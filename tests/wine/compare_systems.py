@@ -29,6 +29,7 @@ class Linux:
 
     def __init__(self, program, work):
         self.program = [str(program)]
+        self.home = str(program.parent)
         self.folder = work / "linux"
         self.environment = dict(os.environ, XDG_CONFIG_HOME="/none", LC_ALL="C.UTF-8")
 
@@ -56,7 +57,8 @@ class Windows(Linux):
             self.run(["--init"], work)
         shutil.rmtree(home, ignore_errors=True)
         shutil.copytree(laid_out, home)
-        self.program = [self.wine, r"C:\médiâ tools\cliphost.exe"]
+        self.home = r"C:\médiâ tools"
+        self.program = [self.wine, self.home + r"\cliphost.exe"]
         self.folder = work / "windows"
 
     def path(self, path):
@@ -67,9 +69,10 @@ class Windows(Linux):
         subprocess.run([server, "-k"], env=self.environment, check=False)
 
 
-def plain(text):
-    """A text with this system's names of the files that it names."""
-    text = re.sub(r"/?\bZ:(?=[/\\])", "", text.decode("utf-8", "replace"))
+def plain(text, side):
+    """A text of a side with this system's names of the files that it names, and of the program's own folder."""
+    text = text.decode("utf-8", "replace").replace(side.home, "HOME")
+    text = re.sub(r"/?\bZ:(?=[/\\])", "", text)
     text = re.sub(r"\\\\|\\", "/", text)
     for pattern, instead in PASSING:
         text = pattern.sub(instead, text)
@@ -120,9 +123,10 @@ class Comparison:
             self.faults.append(f"{name}: exit status {linux[0]} on Linux, {windows[0]} on Windows: "
                                f"{windows[2][-500:]!r}")
             return
-        for what, mine, yours in zip(["output", "messages"], linux[1:], windows[1:]):
-            if plain(mine) != plain(yours):
-                self.faults.append(f"{name}: other {what}:" + first_difference(plain(mine), plain(yours)))
+        for what, *texts in zip(["output", "messages"], linux[1:], windows[1:]):
+            texts = [plain(text, side) for text, side in zip(texts, self.sides)]
+            if texts[0] != texts[1]:
+                self.faults.append(f"{name}: other {what}:" + first_difference(*texts))
 
     def compare_files(self, name, linux, windows):
         for file in sorted(linux.keys() ^ windows.keys()):
@@ -130,8 +134,8 @@ class Comparison:
         for file in sorted(linux.keys() & windows.keys()):
             self.files += 1
             mine, yours = linux[file].read_bytes(), windows[file].read_bytes()
-            if file.endswith((".html", ".json", ".csv")):
-                mine, yours = plain(mine), plain(yours)
+            if file.endswith((".html", ".csv")):
+                mine, yours = (plain(text, side) for text, side in zip((mine, yours), self.sides))
             if mine != yours:
                 count = sum(a != b for a, b in zip(mine, yours)) + abs(len(mine) - len(yours))
                 self.faults.append(f"{name}: {file} differs at {count} of {len(mine)} places")
