@@ -261,7 +261,8 @@ std::string InWords(const ComparedObject& object) {
     } else if (!object.id.empty()) {
         text += ' ' + object.id;
     }
-    return object.descriptor.empty() ? text : fmt::format("{} ({})", text, object.descriptor);
+    return object.descriptor.empty() ? text
+                                     : fmt::format("{} ({})", text, Shown(object.descriptor));
 }
 
 ComparisonCounts CompareFiles(IAAFFile* before, IAAFFile* after, const TakeDifference& take,

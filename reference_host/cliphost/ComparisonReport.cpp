@@ -110,10 +110,12 @@ std::string ComparisonJson::LineEnd(std::size_t level) const {
 ordered_json ToJson(const ComparedObject& object, const TreeDifference& difference) {
     return {
         {"object",
-         {{"class", object.kind}, {"id", OrNull(object.id)}, {"name", OrNull(Shown(object.name))}}},
+         {{"class", Shown(object.kind)},
+          {"id", OrNull(object.id)},
+          {"name", OrNull(Shown(object.name))}}},
         {"kind", NameOf(difference.kind)},
         {"place", difference.place},
-        {"property", OrNull(difference.property)},
+        {"property", OrNull(Shown(difference.property))},
         {"before", OrNull(difference.before)},
         {"after", OrNull(difference.after)},
         {"words", IsOfWhole(difference) ? WholeInWords(object, difference) : InWords(difference)}};

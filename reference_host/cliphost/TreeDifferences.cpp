@@ -70,7 +70,7 @@ std::string KindOfData(const TreeNode& node) {
     const std::size_t id = data.find('{');
     const std::string kind =
         id == std::string::npos ? std::string() : KindOfDataNamed(data.substr(id));
-    return kind.empty() ? data.substr(0, data.find(" {")) : kind;
+    return kind.empty() ? Shown(data.substr(0, data.find(" {"))) : kind;
 }
 
 std::string KindOfSlot(const TreeNode& slot) {
@@ -119,7 +119,7 @@ public:
         const TreeNode& node = list_.nodes[at];
         const TreeNode::Fact* const key = KeyOf(node);
         if (key == nullptr) {
-            return fmt::format("{} {} ({})", Ordinal(at + 1), OneOf(list_.name), node.title);
+            return fmt::format("{} {} ({})", Ordinal(at + 1), OneOf(list_.name), Shown(node.title));
         }
         if (key->name != kSlotId) {
             return fmt::format("{} {}", OneOf(list_.name), Shown(key->value));
@@ -224,7 +224,8 @@ const char* NameOf(Kind kind) {
     return kNames[static_cast<std::size_t>(kind)];
 }
 
-std::string PropertyWords(const std::string& name) {
+std::string PropertyWords(const std::string& property) {
+    const std::string name = Shown(property);
     const auto isUpper = [&](std::size_t i) {
         return i < name.size() && name[i] >= 'A' && name[i] <= 'Z';
     };

@@ -38,7 +38,7 @@ std::string InWords(const TreeDifference& difference);
 std::string Shown(const std::string& value);
 
 // "EditRate" -> "edit rate"
-std::string PropertyWords(const std::string& name);
+std::string PropertyWords(const std::string& property);
 
 // Compares trees of objects, property by property. Objects in a list are those with the same key,
 // such as a slot's id or a name; the rest go by their content, and then by their order. What says

@@ -77,16 +77,17 @@ struct EntrySearch {
     std::vector<const PlacedElement*> strangers = {};  // the outermost elements without an entry
 
     void Enter(const PlacedElement& element) {
-        if (element.name == name) {
-            entries.push_back(&element);
-            return;
-        }
         const std::size_t entriesBefore = entries.size();
         const std::size_t strangersBefore = strangers.size();
+        if (element.name == name) {
+            entries.push_back(&element);
+        }
         for (const PlacedElement& child : element.elements) {
             Enter(child);
         }
-        if (entries.size() == entriesBefore) {
+        if (element.name == name) {
+            strangers.resize(strangersBefore);  // they are looked at with the entry
+        } else if (entries.size() == entriesBefore) {
             strangers.resize(strangersBefore);
             strangers.push_back(&element);
         }

@@ -27,6 +27,12 @@ def why_none():
     for program in ("chromium", "chromedriver"):
         if not shutil.which(program):
             return f"there is no {program} (Debian's packages chromium and chromium-driver)"
+    if os.geteuid() != 0:
+        # Its sandbox needs what not every system lets its users have; without one it runs for root alone.
+        try:
+            start().quit()
+        except WebDriverException as error:
+            return f"Chromium does not start for this user: {str(error).splitlines()[0]}"
     return ""
 
 

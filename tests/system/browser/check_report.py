@@ -187,6 +187,19 @@ class ReportInBrowser(unittest.TestCase):
         self.assertIn("can't be opened", told)
         self.assertEqual(len(self.page.all(".placeholder")), 1)
 
+    def test_tells_why_a_clip_has_no_pictures(self):
+        self.page.open(self.undrawn, "#/clip/1")
+        self.assertRegex(self.page.one(".placeholder").text, "^No pictures. pictures: .*xyz1")
+        self.page.open(self.undrawn)
+        self.assertEqual(self.page.texts(".poster"), ["no picture"])
+
+    def test_draws_sound_without_a_sample(self):
+        wave = {"track": 1, "seconds": 0, "isWhole": True, "lacksSamples": False, "peaks": [], "means": []}
+        page = pages.with_details(self.report, 0, {"waves": [wave]}, self.report.with_name("empty sound.html"))
+        self.page.open(page, "#/clip/1")
+        self.assertEqual(len(self.page.all(".wave path.peak")), 1)
+        self.assertEqual(self.page.complaints(), [])
+
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys
         self.open()
@@ -318,6 +331,8 @@ def main(program, movies, work):
         pages.make_movies(Path(movies), folder / "movies")
         ReportInBrowser.report = pages.write(program, folder / "movies", folder / "report.html")
         ReportInBrowser.split = pages.write(program, folder / "movies", folder / "a split #1 100%.html", "--split")
+        pages.make_undrawn(Path(movies), folder / "undrawn")
+        ReportInBrowser.undrawn = pages.write(program, folder / "undrawn", folder / "undrawn.html")
         ReportInBrowser.many = pages.multiply(ReportInBrowser.report, 1000, folder / "many.html")
         ReportInBrowser.count = len(pages.document(ReportInBrowser.report.read_text(encoding="utf-8"))["clips"])
         ReportInBrowser.axe, ReportInBrowser.no_axe = axe_script(Path(work))

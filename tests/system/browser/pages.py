@@ -57,6 +57,13 @@ def make_movies(made, folder):
     (folder / "day 2" / "none.mov").write_bytes(b"no movie at all\n" * 100)
 
 
+def make_undrawn(made, folder):
+    """A movie whose codec nobody knows."""
+    folder.mkdir()
+    movie = (made / "png.mov").read_bytes()
+    (folder / "unknown.mov").write_bytes(movie.replace(b"png ", b"xyz1"))
+
+
 def copy(made, name, to):
     to.parent.mkdir(parents=True, exist_ok=True)
     shutil.copyfile(made / f"{name}.mov", to)
@@ -86,6 +93,15 @@ def document(text):
 def in_script(value):
     text = json.dumps(value, ensure_ascii=False, separators=(",", ":"))
     return re.sub("[<>&\u2028\u2029]", lambda found: "\\u%04x" % ord(found[0]), text)
+
+
+def with_details(page, number, members, to):
+    """The page, but for members of a clip's details."""
+    text = page.read_text(encoding="utf-8")
+    start, end = element(text, f"clip-{number}")
+    details = dict(json.loads(text[start:end]), **members)
+    to.write_text(text[:start] + in_script(details) + text[end:], encoding="utf-8")
+    return to
 
 
 def multiply(page, count, to):

@@ -103,10 +103,14 @@ TEST(ComparisonInJson, IsNoneUntilItIsFinished) {
 
 // A file may have a name of megabytes, and as many differences as it likes.
 TEST(ComparisonInJson, CutsLongNames) {
-    ComparedObject clip = kClip;
-    clip.name.assign(1u << 20, 'x');
-    EXPECT_LT(ToJson(clip, Whole(Kind::Gone)).dump().size(), 2000u);
-    EXPECT_LT(InWords(clip).size(), 500u);
+    const std::string name(1u << 20, 'x');
+    const ComparedObject clip = {name, "urn:a", name, name};
+    TreeDifference changed = Whole(Kind::Changed);
+    changed.property = name;
+    for (const TreeDifference& difference : {Whole(Kind::Gone), changed}) {
+        EXPECT_LT(ToJson(clip, difference).dump().size(), 2000u);
+    }
+    EXPECT_LT(InWords(clip).size(), 1000u);
 }
 
 }  // namespace

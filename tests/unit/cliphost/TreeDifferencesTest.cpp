@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "reference_host/cliphost/AafValue.h"
 
@@ -226,6 +228,22 @@ TEST(TreeDifferences, CutLongNames) {
         ASSERT_EQ(one.place.size(), 1u);
         EXPECT_LT(one.place[0].size(), 500u);
     }).Compare(Comments({Comment(name, "1")}), Comments({Comment(name, "2")}));
+    const auto longest = [](const Texts& texts) {
+        std::size_t most = 0;
+        for (const std::string& text : texts) {
+            most = std::max(most, text.size());
+        }
+        return most;
+    };
+    EXPECT_LT(longest(Differences(Node("Mob", {{name, "1"}}), Node("Mob", {{name, "2"}}))), 500u);
+    EXPECT_LT(longest(Differences(Sequence({Part(name, "1")}), Sequence({Part("Filler", "2")}))),
+              500u);
+    const auto slot = [&](const char* length) {
+        TreeNode one = Sound("1", length);
+        one.branches[0].nodes[0].facts[0].value = name;
+        return one;
+    };
+    EXPECT_LT(longest(Differences(Mob({slot("1")}), Mob({slot("2")}))), 500u);
 }
 
 TEST(TreeDifferences, CutLongValuesBetweenCharacters) {

@@ -335,6 +335,11 @@ TEST_F(DataChecks, TakeEntriesOutOfElementsAroundThem) {
     EXPECT_THAT(Check("<Group><More>" + Record(Good()) + "</More></Group>",
                       "<DV>" + Row("dvc ", "vcid='10000'") + "</DV>"),
                 IsEmpty());
+    // One that lacks its end, and so holds the next, is told alone.
+    EXPECT_THAT(
+        Check(Record(Good()), "<FourCharMapping FourChar='AVxx' vcid='10000'>" +
+                                  Row("dvc ", "vcid='10000'") + "</FourCharMapping>"),
+        ElementsAre(HasSubstr("FourCharMapper.xml:2:47: FourCharMapping means nothing here")));
     EXPECT_THAT(Check("<Group>\n<x><y/></x>" + Record(Good()) + "</Group>"),
                 ElementsAre(HasSubstr("AAFInfo.xml:3:1: x means nothing here")));
 }

@@ -109,7 +109,8 @@ TEST_F(HostChecks, FindRowsWhereTheModuleFindsThem) {
     const std::string path =
         Write("map.xml",
               "<Map><DV><More><FourCharMapping FourChar='dvc ' vcid='7'/></More></DV>"
-              "<Other/><FourCharMapping FourChar='dvcp' vcid='8'/></Map>");
+              "<Other/><FourCharMapping FourChar='dvcp' vcid='8'>"
+              "<FourCharMapping FourChar='dvpp' vcid='9'/></FourCharMapping></Map>");
     const FourCharDataContainerReader module(host.factory(), NMAString(path.c_str()));
     data_check::Findings findings;
     const data_check::MapperRows read = data_check::ReadMapperRows(Load(path), findings);
@@ -119,7 +120,7 @@ TEST_F(HostChecks, FindRowsWhereTheModuleFindsThem) {
         EXPECT_EQ(module.GetVCIDByFourChar(WordOf(row.code), &id), NCF_OK);
         EXPECT_EQ(id, row.id);
     }
-    EXPECT_EQ(findings.count(), 1u) << "the element that holds nothing";
+    EXPECT_EQ(findings.count(), 2u) << "the element that holds nothing, and the row inside another";
 }
 
 // A value that an attribute of its element replaces is told, and no id is read there.
