@@ -1,6 +1,7 @@
 # Read by ctest for one test program: a row for each suite, or for each test of the suites that stay
 # APART. The rows are listed anew whenever the program is newer than their list.
 #   name, program, rows: the program's name and file, and where its list is kept
+#   emulator: what runs the program where this system can't
 #   apart: regular expressions of suites; filter: of the tests; properties: of each row
 if(NOT EXISTS "${program}")
   add_test("${name}_NOT_BUILT" "${name}_NOT_BUILT")
@@ -8,14 +9,14 @@ if(NOT EXISTS "${program}")
 endif()
 
 function(list_rows)
-  execute_process(COMMAND "${program}" --gtest_list_tests "--gtest_filter=${filter}"
+  execute_process(COMMAND ${emulator} "${program}" --gtest_list_tests "--gtest_filter=${filter}"
                   TIMEOUT 60 OUTPUT_VARIABLE listed RESULT_VARIABLE result)
   if(NOT result STREQUAL 0)
     message(FATAL_ERROR "${name} can't list its tests: ${result}\n${listed}")
   endif()
   # The value of a parameter is behind its number or name, as a comment.
   string(REGEX REPLACE " *#[^\n]*" "" listed "${listed}")
-  string(REPLACE "\n" ";" listed "${listed}")
+  string(REGEX REPLACE "\r?\n" ";" listed "${listed}")
 
   set(script "")
   foreach(line IN LISTS listed)
@@ -53,7 +54,11 @@ endfunction()
 # Text for `script`, in the caller's scope. What the filter leaves out is left out of a suite, too.
 macro(add_row row tests)
   string(REGEX MATCH "-.*" left_out "${filter}")
-  string(APPEND script "add_test([==[${row}]==] [==[${program}]==] [==[--gtest_filter=${tests}${left_out}]==])\n"
+  set(begin "")
+  foreach(word IN LISTS emulator)
+    string(APPEND begin " [==[${word}]==]")
+  endforeach()
+  string(APPEND script "add_test([==[${row}]==]${begin} [==[${program}]==] [==[--gtest_filter=${tests}${left_out}]==])\n"
                        "set_tests_properties([==[${row}]==] PROPERTIES SKIP_RETURN_CODE 77")
   foreach(property IN LISTS properties)
     string(APPEND script " [==[${property}]==]")

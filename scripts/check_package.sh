@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# check_package.sh PACKAGE.deb: installs it into an empty root, describes a movie with what lies
-# there, removes it, and looks for what is left. Its dependencies are those of this machine.
+# check_package.sh PACKAGE.deb: installs it into an empty root, describes a movie and builds a module
+# with what lies there, removes it, and looks for what is left. Its dependencies are those of this machine.
 set -euo pipefail
 package=$(realpath "$1")
 root=$(mktemp -d)
@@ -57,7 +57,18 @@ cd "$root"  # where no other headers are
 printf '#include "host_interfaces/framework/PluginEntry.h"\n' \
   | g++ -std=c++17 -fsyntax-only $flags -x c++ - || fail "the headers do not compile"
 
+# The module to begin with, as whoever has the package alone builds and checks it.
+example=$root/usr/share/doc/cliphost/examples/minimal_module
+[ "$(wc -l <"$example/MinimalModule.cpp")" -lt 200 ] || fail "the minimal module has 200 lines or more"
+cp -r "$example" "$root/mine"
+{ PKG_CONFIG_PATH=$root/usr/share/pkgconfig cmake -S "$root/mine" -B "$root/mine/build" \
+    && cmake --build "$root/mine/build"; } >"$root/mine/log" 2>&1 \
+  || { cat "$root/mine/log" >&2; fail "the minimal module can't be built"; }
+"$program" validate "$root/mine/build/examples/MinimalModule.nvx" --seed 1 >"$root/mine/log" \
+  || { grep -vE '^(passed|skipped)|^ +because ' "$root/mine/log" >&2; fail "the minimal module is not right"; }
+rm -r "$root/mine"
+
 packages --purge cliphost
 left=$(comm -13 <(printf '%s\n' "$before") <(things))
 [ -z "$left" ] || fail "the package leaves $left"
-printf 'the package installs, describes a movie, and leaves nothing when removed\n'
+printf 'the package installs, describes a movie, builds a module, and leaves nothing when removed\n'

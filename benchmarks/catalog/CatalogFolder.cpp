@@ -15,8 +15,8 @@
 #include "benchmarks/growth/TimedCommand.h"
 #include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
+#include "benchmarks/support/ShortMovies.h"
 #include "reference_host/catalog/Catalog.h"
-#include "reference_host/movie_writer/Movie.h"
 #include "tests/support/TestFolder.h"
 
 namespace {
@@ -36,19 +36,10 @@ std::string In(const std::string& name) {
     return (Folder() / name).string();
 }
 
-// Short movies with one picture and one sound track.
 std::string Movies() {
     static const std::string path = [] {
         fs::create_directory(Folder() / "movies");
-        for (int i = 0; i < kMovies; ++i) {
-            movies::Movie movie;
-            movies::VideoFormat format;
-            format.codec = "apcn";
-            movie.tracks.push_back(
-                movies::VideoTrack(format, 48u + static_cast<unsigned>(i) % 100, 25, 1));
-            movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 96000));
-            movies::Build(movie).WriteTo(In("movies/" + std::to_string(i) + ".mov"));
-        }
+        WriteShortMovies(Folder() / "movies", kMovies);
         return In("movies");
     }();
     return path;

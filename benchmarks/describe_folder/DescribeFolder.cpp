@@ -15,11 +15,12 @@
 #include "benchmarks/support/Brief.h"
 #include "benchmarks/support/ColdFiles.h"
 #include "benchmarks/support/Ratios.h"
+#include "benchmarks/support/ShortMovies.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "reference_host/cliphost/Describe.h"
 #include "reference_host/cliphost/FolderClips.h"
 #include "reference_host/cliphost/MovieAnswer.h"
-#include "reference_host/movie_writer/Movie.h"
+#include "tests/support/TestFolder.h"
 
 extern "C" {
 #include <libavformat/avformat.h>
@@ -30,46 +31,18 @@ namespace {
 
 const int kMovies = Sized(1000, 20);
 
-// A folder that is deleted when the process ends.
-class OwnFolder {
-public:
-    explicit OwnFolder(const std::string& name)
-        : path_(std::filesystem::temp_directory_path() / (name + std::to_string(getpid()))) {
-        std::filesystem::create_directories(path_);
-    }
-    ~OwnFolder() { std::filesystem::remove_all(path_); }
-    OwnFolder(const OwnFolder&) = delete;
-    OwnFolder& operator=(const OwnFolder&) = delete;
-    const std::filesystem::path& Path() const { return path_; }
-
-private:
-    std::filesystem::path path_;
-};
-
-const OwnFolder& Saved() {
-    static const OwnFolder folder("bench-saved-");
+const TestFolder& Saved() {
+    static const TestFolder folder;
     return folder;
 }
 
-// Short movies with one picture and one sound track.
-class MovieFolder : public OwnFolder {
-public:
-    MovieFolder() : OwnFolder("bench-movies-") {
-        for (int i = 0; i < kMovies; ++i) {
-            movies::Movie movie;
-            movies::VideoFormat format;
-            format.codec = "apcn";
-            movie.tracks.push_back(
-                movies::VideoTrack(format, 48u + static_cast<unsigned>(i) % 100, 25, 1));
-            movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 96000));
-            movies::Build(movie).WriteTo((Path() / (std::to_string(i) + ".mov")).string());
-        }
-    }
-};
-
-const MovieFolder& Folder() {
-    static const MovieFolder folder;
-    return folder;
+const std::filesystem::path& Movies() {
+    struct Written {
+        Written() { WriteShortMovies(folder.path(), kMovies); }
+        TestFolder folder;
+    };
+    static const Written movies;
+    return movies.folder.path();
 }
 
 double ResidentMegabytes() {
@@ -95,8 +68,8 @@ void DescribeAll(benchmark::State& state, Place place) {
     cliphost::DescriptionForm form;
     form.quiet = true;
     for (auto _ : state) {
-        MakeFolderCold(state, Folder().Path());
-        const cliphost::FolderClips clips(session, Folder().Path());
+        MakeFolderCold(state, Movies());
+        const cliphost::FolderClips clips(session, Movies());
         for (const cliphost::FolderClip& clip : clips.clips()) {
             const auto description =
                 cliphost::DescribeFromList(session, clips.list(), clip.index, clip.path);
@@ -118,16 +91,15 @@ void DescribeFolder(benchmark::State& state) {
 // As with --out-dir; every pass but the first replaces the files of the one before.
 void DescribeAndSaveFolder(benchmark::State& state) {
     DescribeAll(state, [](const cliphost::FolderClip& clip) {
-        return Saved().Path() /
-               std::filesystem::path(clip.path).filename().replace_extension(".aaf");
+        return Saved() / std::filesystem::path(clip.path).filename().replace_extension(".aaf");
     });
 }
 
 void OpenAndFindStreams(benchmark::State& state) {
     av_log_set_level(AV_LOG_QUIET);
     for (auto _ : state) {
-        MakeFolderCold(state, Folder().Path());
-        for (const auto& entry : std::filesystem::directory_iterator(Folder().Path())) {
+        MakeFolderCold(state, Movies());
+        for (const auto& entry : std::filesystem::directory_iterator(Movies())) {
             AVFormatContext* context = nullptr;
             if (avformat_open_input(&context, entry.path().c_str(), nullptr, nullptr) < 0 ||
                 avformat_find_stream_info(context, nullptr) < 0) {

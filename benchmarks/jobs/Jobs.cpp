@@ -12,7 +12,7 @@
 
 #include "benchmarks/support/Brief.h"
 #include "benchmarks/support/Ratios.h"
-#include "reference_host/movie_writer/Movie.h"
+#include "benchmarks/support/ShortMovies.h"
 #include "tests/support/Quoted.h"
 #include "tests/support/TestFolder.h"
 
@@ -22,22 +22,13 @@ namespace fs = std::filesystem;
 
 const int kMovies = Sized(8000, 20);
 
-// Short movies with one picture and one sound track, half of them in either folder.
+// Half of the movies in either folder.
 class TwoFolders {
 public:
     TwoFolders() {
         for (const char* const half : {"a", "b"}) {
             fs::create_directory(folder_ / half);
-        }
-        for (int i = 0; i < kMovies; ++i) {
-            movies::Movie movie;
-            movies::VideoFormat format;
-            format.codec = "apcn";
-            movie.tracks.push_back(
-                movies::VideoTrack(format, 48u + static_cast<unsigned>(i) % 100, 25, 1));
-            movie.tracks.push_back(movies::SoundTrack(movies::SoundFormat(), 96000));
-            movies::Build(movie).WriteTo(
-                (folder_ / (i % 2 == 0 ? "a" : "b") / (std::to_string(i) + ".mov")).string());
+            WriteShortMovies(folder_ / half, kMovies / 2);
         }
     }
     std::string Half(const char* name) const { return Quoted(folder_ / name); }

@@ -23,6 +23,9 @@ struct Measured {
 // Keeps every run, by name and arguments, beside printing it.
 class KeepingReporter : public benchmark::ConsoleReporter {
 public:
+    // Without colours, whose ends would stand before the rows in a file.
+    KeepingReporter() : ConsoleReporter(OO_Tabular) {}
+
     void ReportRuns(const std::vector<Run>& runs) override {
         for (const Run& run : runs) {
             if (run.run_type == Run::RT_Iteration && !run.error_occurred) {

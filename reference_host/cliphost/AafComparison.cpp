@@ -24,6 +24,7 @@ struct Entry {
     ComparedObject about;
     host::Ref<IAAFObject> object;
     bool isMatched = false;
+    const std::string* why = nullptr;  // nothing is known of what became of it
 };
 
 // The objects of a file in an order in which the mobs of a clip stand together.
@@ -95,14 +96,20 @@ private:
 
 class FileComparison {
 public:
-    FileComparison(IAAFFile* before, IAAFFile* after, const TakeDifference& take)
-        : before_(before), after_(after), take_(take), trees_([this](const TreeDifference& one) {
+    FileComparison(IAAFFile* before, IAAFFile* after, const TakeDifference& take,
+                   const UnknownMobs& unknown)
+        : before_(before),
+          after_(after),
+          take_(take),
+          unknown_(unknown),
+          trees_([this](const TreeDifference& one) {
               ++counts_.differences;
               take_(about_, one);
           }) {}
 
     ComparisonCounts Run() {
         MatchById();
+        LeaveUnknown();
         MatchRest(
             [](const ComparedObject& one) { return Name(one.kind, one.name, one.descriptor); });
         if (pairs_.empty()) {  // files of one clip each
@@ -111,7 +118,9 @@ public:
         CompareHeaders();
         for (const Entry& entry : before_.entries()) {
             const auto pair = pairs_.find(&entry);
-            if (pair == pairs_.end()) {
+            if (entry.why != nullptr) {
+                TellUnknown(entry);
+            } else if (pair == pairs_.end()) {
                 TellWhole(before_, entry, Kind::Gone, counts_.gone);
             } else {
                 ComparePair(entry, *pair->second);
@@ -152,6 +161,15 @@ private:
         }
     }
 
+    void LeaveUnknown() {
+        for (Entry& entry : before_.entries()) {
+            const auto found = entry.isMatched ? unknown_.end() : unknown_.find(entry.about.id);
+            if (found != unknown_.end()) {
+                entry.why = &found->second;
+            }
+        }
+    }
+
     // A movie that was written anew has other ids. Pairs those that are the only ones of their name
     // in both files.
     template <class NameOf>
@@ -171,7 +189,7 @@ private:
                                                            const NameOf& nameOf) {
         std::map<Name, std::vector<Entry*>> names;
         for (Entry& entry : file.entries()) {
-            if (!entry.isMatched) {
+            if (!entry.isMatched && entry.why == nullptr) {
                 FileObjects::Describe(file.Read(entry), entry.about);
                 names[nameOf(entry.about)].push_back(&entry);
             }
@@ -213,9 +231,21 @@ private:
         take_(about_, difference);
     }
 
+    void TellUnknown(const Entry& entry) {
+        about_ = entry.about;
+        FileObjects::Describe(before_.Read(entry), about_);
+        TreeDifference difference;
+        difference.kind = Kind::Unknown;
+        difference.before = about_.kind;
+        difference.reason = *entry.why;
+        ++counts_.unknown;
+        take_(about_, difference);
+    }
+
     FileObjects before_;
     FileObjects after_;
     const TakeDifference& take_;
+    const UnknownMobs& unknown_;
     TreeComparison trees_;
     std::map<const Entry*, Entry*> pairs_;
     ComparedObject about_;  // whose differences are told
@@ -227,15 +257,17 @@ private:
 std::string InWords(const ComparedObject& object) {
     std::string text = PropertyWords(object.kind);
     if (!object.name.empty()) {
-        text += fmt::format(" \"{}\"", object.name);
+        text += fmt::format(" \"{}\"", Shown(object.name));
     } else if (!object.id.empty()) {
         text += ' ' + object.id;
     }
-    return object.descriptor.empty() ? text : fmt::format("{} ({})", text, object.descriptor);
+    return object.descriptor.empty() ? text
+                                     : fmt::format("{} ({})", text, Shown(object.descriptor));
 }
 
-ComparisonCounts CompareFiles(IAAFFile* before, IAAFFile* after, const TakeDifference& take) {
-    return FileComparison(before, after, take).Run();
+ComparisonCounts CompareFiles(IAAFFile* before, IAAFFile* after, const TakeDifference& take,
+                              const UnknownMobs& unknown) {
+    return FileComparison(before, after, take, unknown).Run();
 }
 
 }  // namespace cliphost

@@ -3,6 +3,8 @@
 #pragma once
 
 #include <functional>
+#include <string>
+#include <unordered_map>
 
 #include "host_interfaces/aaf/AAFFile.h"
 #include "reference_host/cliphost/TreeDifferences.h"
@@ -23,6 +25,7 @@ struct ComparisonCounts {
     std::size_t changed = 0;
     std::size_t gone = 0;
     std::size_t added = 0;
+    std::size_t unknown = 0;      // of which nothing is known now
     std::size_t differences = 0;  // of all of them
     std::size_t unread = 0;       // values of both files that nothing can be said of
 
@@ -32,10 +35,15 @@ struct ComparisonCounts {
 // Takes one difference after the other; those of one object come together.
 using TakeDifference = std::function<void(const ComparedObject&, const TreeDifference&)>;
 
+// Mobs of the first file of which it is not known what the second one would have, by their ids, and
+// why.
+using UnknownMobs = std::unordered_map<std::string, std::string>;
+
 // Compares two files, whoever made them, mob by mob. Mobs are those with the same id; of the rest
 // those that are the only ones of their class and name, or of their class alone where the files
 // share no mob. Who wrote a file and when is left out, and so are definitions, which are compared
 // where they are used. Holds no more than two mobs at once.
-ComparisonCounts CompareFiles(IAAFFile* before, IAAFFile* after, const TakeDifference& take);
+ComparisonCounts CompareFiles(IAAFFile* before, IAAFFile* after, const TakeDifference& take,
+                              const UnknownMobs& unknown = {});
 
 }  // namespace cliphost

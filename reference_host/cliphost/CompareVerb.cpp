@@ -20,34 +20,16 @@ struct CompareOptions {
     bool json = false;
 };
 
-std::string Indented(const ordered_json& json) {
-    return json.dump(2, ' ', false, ordered_json::error_handler_t::replace);
-}
-
-// Written as it is found: there may be more differences than memory.
-int PrintComparisonAsJson(const ordered_json& files, IAAFFile* before, IAAFFile* after) {
-    std::string head = Indented(WithSchema(schema::kCompare, files));
-    head.resize(head.rfind('\n'));
-    fmt::print("{},\n  \"differences\": [", head);
-    const char* separator = "\n";
+// A reader of the output may go away before all is told; what it saw counts for the status.
+template <class Printer>
+void PrintComparison(Printer& printer, IAAFFile* before, IAAFFile* after, int& status) {
     const ComparisonCounts counts = CompareFiles(
         before, after, [&](const ComparedObject& object, const TreeDifference& difference) {
-            fmt::print("{}{}", separator, Indented(ToJson(object, difference)));
-            separator = ",\n";
+            status = kExitFile;
+            printer.Take(object, difference);
         });
-    fmt::print("{}],\n  \"counts\": {}\n}}\n", counts.AreEqual() ? "" : "\n",
-               Indented(ToJson(counts)));
-    return StatusOf(counts);
-}
-
-int PrintComparison(IAAFFile* before, IAAFFile* after) {
-    ComparisonLines lines;
-    const ComparisonCounts counts = CompareFiles(
-        before, after, [&](const ComparedObject& object, const TreeDifference& difference) {
-            lines.Take(object, difference);
-        });
-    lines.Finish(counts);
-    return StatusOf(counts);
+    status = StatusOf(counts);
+    printer.Finish(counts);
 }
 
 }  // namespace
@@ -73,13 +55,22 @@ void AddCompare(CLI::App& app, const SessionOptions& session, int& status) {
     verb->callback([&session, &status, options] {
         const ordered_json files = {{"beforeFile", MachinePath(options->before)},
                                     {"afterFile", MachinePath(options->after)}};
+        std::unique_ptr<AafLibrary> library;
+        host::Ref<IAAFFile> before;
+        host::Ref<IAAFFile> after;
+        // Behind the start of an answer, a failure would be none.
         AnswerFailureToo(options->json, schema::kCompare, files, [&] {
-            const std::unique_ptr<AafLibrary> library = LoadAafLibrary(session);
-            const host::Ref<IAAFFile> before = library->Open(options->before);
-            const host::Ref<IAAFFile> after = library->Open(options->after);
-            status = options->json ? PrintComparisonAsJson(files, before.get(), after.get())
-                                   : PrintComparison(before.get(), after.get());
+            library = LoadAafLibrary(session);
+            before = library->Open(options->before);
+            after = library->Open(options->after);
         });
+        if (options->json) {
+            ComparisonJson json(WithSchema(schema::kCompare, files), ComparisonJson::Form::Lines);
+            PrintComparison(json, before.get(), after.get(), status);
+        } else {
+            ComparisonLines lines;
+            PrintComparison(lines, before.get(), after.get(), status);
+        }
     });
 }
 

@@ -6,6 +6,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include "reference_host/cliphost/AafClips.h"
+#include "reference_host/cliphost/AafValue.h"
 #include "reference_host/cliphost/ComparisonReport.h"
 #include "reference_host/cliphost/CsvTable.h"
 #include "reference_host/cliphost/JsonAnswer.h"
@@ -182,6 +184,9 @@ bool DescribeRun::ReadAnswer(const std::string& bytes, MovieAnswer& answer) {
 }
 
 void DescribeRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    if (against_) {
+        failures_.emplace(AbsolutePath(movie), problem.reason);
+    }
     if (options_.form.json) {
         ordered_json head = {{"movie", MachinePath(movie)}};
         AddProblem(problem, head);
@@ -228,34 +233,73 @@ void DescribeRun::Show(const std::filesystem::path& movie, const MovieAnswer& an
     AddEntry(head, answer.description);
 }
 
+Problem DescribeRun::WhyNotCompared() const {
+    if (IsStopped()) {
+        return {options_.against, "not compared: not all movies were read"};
+    }
+    return bin_->clips().empty() ? Problem{options_.against, "not compared: no movie was described"}
+                                 : Problem{};
+}
+
+// Null where neither the movie failed nor a folder that it lies in.
+const std::string* DescribeRun::WhyFailed(const std::filesystem::path& movie) const {
+    for (std::filesystem::path path = movie; path.has_relative_path(); path = path.parent_path()) {
+        if (const auto failure = failures_.find(path); failure != failures_.end()) {
+            return &failure->second;
+        }
+    }
+    return nullptr;
+}
+
+// Those of clips whose locators name a movie that failed.
+UnknownMobs DescribeRun::MobsOfFailures() const {
+    UnknownMobs mobs;
+    if (failures_.empty()) {
+        return mobs;
+    }
+    PathMaps maps = options_.form.maps;
+    for (const AafClip& clip : ClipsOf(against_.get())) {
+        for (std::string url : clip.urls) {
+            maps.MapToThis(url);
+            UrlPlace place;
+            const bool isHere = ReadFileUrl(url, place) && place.machine.empty();
+            const std::string* const why = isHere ? WhyFailed(AbsolutePath(place.path)) : nullptr;
+            if (why == nullptr) {
+                continue;
+            }
+            mobs.emplace(ToText(clip.id), *why);
+            for (const aafMobID_t& source : clip.sources) {
+                mobs.emplace(ToText(source), *why);
+            }
+        }
+    }
+    return mobs;
+}
+
 // As if the bin had been saved and was compared then.
 void DescribeRun::TellDifferences() {
-    const std::filesystem::path& file = options_.against;
-    if (IsStopped() || bin_->clips().empty()) {
-        throw Failure(kExitFile, file,
-                      IsStopped() ? "not compared: not all movies were read"
-                                  : "not compared: no movie was described");
+    if (!options_.form.json) {
+        ComparisonLines lines;
+        PrintDifferences(lines);
+        return;
     }
-    ordered_json differences = ordered_json::array();
-    ComparisonLines lines;
-    const ComparisonCounts counts =
-        CompareFiles(against_.get(), bin_->file(),
-                     [&](const ComparedObject& object, const TreeDifference& difference) {
-                         if (options_.form.json) {
-                             differences.push_back(ToJson(object, difference));
-                         } else {
-                             lines.Take(object, difference);
-                         }
-                     });
+    ComparisonJson json(
+        WithSchema(schema::kDescribe, {{"against", MachinePath(options_.against)}}),
+        options_.form.lines ? ComparisonJson::Form::OneLine : ComparisonJson::Form::Lines,
+        options_.form.lines ? 0 : 2);
+    PrintDifferences(json);
+}
+
+template <class Printer>
+void DescribeRun::PrintDifferences(Printer& printer) {
+    const ComparisonCounts counts = CompareFiles(
+        against_.get(), bin_->file(),
+        [&](const ComparedObject& object, const TreeDifference& difference) {
+            printer.Take(object, difference);
+        },
+        MobsOfFailures());
     CountStatus(StatusOf(counts));
-    if (options_.form.json) {
-        AddEntry({{"against", MachinePath(file)},
-                  {"differences", std::move(differences)},
-                  {"counts", ToJson(counts)}},
-                 "");
-    } else {
-        lines.Finish(counts);
-    }
+    printer.Finish(counts);
 }
 
 void DescribeRun::Finish(int described, int failed) {
@@ -269,15 +313,17 @@ void DescribeRun::Finish(int described, int failed) {
             AddEntry(head, "");
         }
     }
-    if (against_) {
-        try {
-            TellDifferences();
-        } catch (const Failure& failure) {
-            TellAlso(failure);
-            ordered_json head = {{"against", MachinePath(options_.against)}};
-            AddProblem(failure.problem(), head);
-            AddEntry(head, "");
-        }
+    const Problem whyNot = against_ ? WhyNotCompared() : Problem{};
+    if (whyNot) {
+        TellAlso(Failure(kExitFile, whyNot));
+        ordered_json head = {{"against", MachinePath(options_.against)}};
+        AddProblem(whyNot, head);
+        AddEntry(head, "");
+        against_.Reset();
+    }
+    const bool isList = options_.form.json && !options_.form.lines;
+    if (against_ && !isList) {
+        TellDifferences();
     }
     if (!options_.form.columnsOut.empty()) {
         try {
@@ -298,13 +344,24 @@ void DescribeRun::Finish(int described, int failed) {
     }
     if (!options_.form.json) {
         PrintSummary(described, failed);
-    } else if (!options_.form.lines) {
-        fmt::print("[");
-        for (std::size_t i = 0; i < entries_.size(); ++i) {
-            fmt::print("{}\n{}", i == 0 ? "" : ",", entries_[i]);
-        }
-        fmt::print("{}]\n", entries_.empty() ? "" : "\n");
+    } else if (isList) {
+        PrintEntries();
     }
+}
+
+// Differences are found while they are printed, so that there may be more than memory.
+void DescribeRun::PrintEntries() {
+    const char* separator = "[\n";
+    for (const std::string& entry : entries_) {
+        fmt::print("{}{}", separator, entry);
+        separator = ",\n";
+    }
+    if (against_) {
+        fmt::print("{}", separator);
+        TellDifferences();
+        separator = "";
+    }
+    fmt::print("{}]\n", entries_.empty() && !against_ ? "[" : "\n");
 }
 
 void DescribeRun::PrintSummary(int described, int failed) const {

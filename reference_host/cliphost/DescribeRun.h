@@ -2,10 +2,12 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <map>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
 #include <string>
 
+#include "reference_host/cliphost/AafComparison.h"
 #include "reference_host/cliphost/Bin.h"
 #include "reference_host/cliphost/MoviesRun.h"
 #include "reference_host/cliphost/RowsOfMovies.h"
@@ -41,15 +43,22 @@ private:
     void WriteColumns() const;
     void AddToBin(IAAFFile* description, const std::filesystem::path& movie);
     void SaveBin();
+    Problem WhyNotCompared() const;
+    const std::string* WhyFailed(const std::filesystem::path& movie) const;
+    UnknownMobs MobsOfFailures() const;
     void TellDifferences();
+    template <class Printer>
+    void PrintDifferences(Printer& printer);
+    void PrintEntries();
     void PrintSummary(int described, int failed) const;
     void AddEntry(const nlohmann::ordered_json& head, const std::string& description);
 
     const DescribeOptions& options_;
     PathMaps maps_;  // to know which were used
     RowsOfMovies rows_;
-    std::optional<Bin> bin_;        // of what is made of all
-    host::Ref<IAAFFile> against_;   // empty: nothing is compared
+    std::optional<Bin> bin_;                                 // of what is made of all
+    host::Ref<IAAFFile> against_;                            // empty: nothing is compared
+    std::map<std::filesystem::path, std::string> failures_;  // movies and folders; for against_
     std::filesystem::path copyOf_;  // what the last movie that went into the bin is a copy of
     std::vector<std::pair<std::filesystem::path::string_type, ColumnValues>> columns_;
     std::vector<std::string> entries_;  // of the JSON list that comes at the end

@@ -110,7 +110,8 @@ void AddDescribe(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost describe --watch FOLDER --recursive --out-dir DIR --skip-done\n"
         "  cliphost describe --watch /mnt/nas/in --poll 30 --out-dir DIR\n"
         "  cliphost describe FOLDER --against OLD.aaf   # what a new version changes\n\n"
-        "--against compares as `cliphost compare` does; differences give status 1.\n" +
+        "--against compares as `cliphost compare` does; differences give status 1. Clips of movies "
+        "that can't be\ndescribed are told as that, not as gone.\n" +
         std::string(kLeftOutOfComparison));
     auto options = std::make_shared<DescribeOptions>();
     auto pinned = std::make_shared<std::string>();

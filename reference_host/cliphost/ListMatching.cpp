@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <deque>
 #include <map>
+#include <set>
+#include <string_view>
 #include <unordered_map>
 
 namespace cliphost {
@@ -30,6 +32,22 @@ public:
             if (there != places.end() && !there->second.empty()) {
                 Pair(i, there->second.front());
                 there->second.pop_front();
+            }
+        }
+    }
+
+    // Pairs elements whose key may change in their order, where both lists have as many of a kind
+    // and not the same keys: then they have others now, and a key that is there may be another's.
+    void PairRenamed() {
+        const auto there = ThoseThatMayChange(after_);
+        for (const auto& [kind, those] : ThoseThatMayChange(before_)) {
+            const auto found = there.find(kind);
+            if (found == there.end() || found->second.size() != those.size() ||
+                KeysOf(before_, those) == KeysOf(after_, found->second)) {
+                continue;
+            }
+            for (std::size_t i = 0; i < those.size(); ++i) {
+                Pair(those[i], found->second[i]);
             }
         }
     }
@@ -89,6 +107,27 @@ public:
 private:
     static constexpr std::size_t kNone = static_cast<std::size_t>(-1);
 
+    using Places = std::vector<std::size_t>;
+
+    static std::map<std::string, Places> ThoseThatMayChange(const std::vector<ListElement>& list) {
+        std::map<std::string, Places> kinds;
+        for (std::size_t i = 0; i < list.size(); ++i) {
+            if (list[i].mayChangeKey) {
+                kinds[list[i].kind].push_back(i);
+            }
+        }
+        return kinds;
+    }
+
+    static std::multiset<std::string_view> KeysOf(const std::vector<ListElement>& list,
+                                                  const Places& places) {
+        std::multiset<std::string_view> keys;
+        for (const std::size_t place : places) {
+            keys.insert(list[place].key);
+        }
+        return keys;
+    }
+
     bool IsLoose(std::size_t i) const { return found_[i] && before_[i].key.empty(); }
 
     void Pair(std::size_t before, std::size_t after) {
@@ -133,6 +172,7 @@ std::vector<std::optional<std::size_t>> MatchLists(const std::vector<ListElement
                                                    const std::vector<ListElement>& after,
                                                    bool isSet) {
     Matching matching(before, after);
+    matching.PairRenamed();
     matching.PairByName([](const ListElement& element) {
         return element.key.empty() ? "" : Under(element.kind, element.key);
     });

@@ -15,7 +15,8 @@ struct ListElement {
     std::string key;
     std::size_t content = 0;  // equal where the contents are, but perhaps for the key
     std::string kind;         // only elements of one kind can be one
-    // Whether one whose key is not there may be the one of the same content.
+    // Whether one whose key is not there may be the one of the same content, and one of as many of
+    // its kind with other keys the one in the same place among them.
     bool mayChangeKey = false;
 };
 

@@ -24,9 +24,6 @@ constexpr std::uint64_t kFrames = 12;
 constexpr double kPixels = 200.0 * 112.5;
 constexpr int kLeastWidth = 24;
 constexpr int kMostWidth = 600;
-// A page of 1,000 clips is to stay below 60 MB.
-constexpr std::size_t kMostBytesOfStrip = 28'000;
-constexpr std::size_t kMostBytesOfPoster = 5'000;
 constexpr std::uint16_t kUnread = 64;  // the grey of a frame that can't be read
 
 struct Size {

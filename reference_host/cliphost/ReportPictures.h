@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstddef>
 #include <nlohmann/json.hpp>
 
 #include "reference_host/cliphost/Essence.h"
@@ -11,6 +12,10 @@ namespace cliphost {
 // What pictures say of themselves.
 inline constexpr char kWebp[] = "image/webp";
 inline constexpr char kPng[] = "image/png";
+
+// So that a page of 1,000 clips stays below 60 MB.
+inline constexpr std::size_t kMostBytesOfStrip = 28'000;
+inline constexpr std::size_t kMostBytesOfPoster = 5'000;
 
 // What a report shows of a movie's pictures: a poster, out of the middle, and a strip, which is
 // one picture of all frames side by side.

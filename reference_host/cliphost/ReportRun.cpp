@@ -7,21 +7,20 @@
 
 #include <ctime>
 #include <fstream>
+#include <utility>
 
 #include "host_interfaces/Version.h"
 #include "reference_host/cliphost/CatalogFile.h"
 #include "reference_host/cliphost/JsonAnswer.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/MapOption.h"
+#include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/OptionChecks.h"
 #include "reference_host/cliphost/ReportClip.h"
 #include "reference_host/cliphost/ReportOdd.h"
-#include "reference_host/cliphost/ReportPictures.h"
 #include "reference_host/cliphost/ReportShape.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
-#include "reference_host/report/PageText.h"
-#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -31,8 +30,6 @@ namespace {
 using Json = nlohmann::ordered_json;
 
 constexpr char kEndingOfFolder[] = "_files";
-constexpr char kPoster[] = "poster";
-constexpr char kStrip[] = "strip";
 constexpr std::int64_t kNanoseconds = 1'000'000'000;
 
 const DescriptionForm& FormOfClip() {
@@ -75,12 +72,17 @@ std::string TitleOf(const ReportOptions& options) {
                                                   : whole.parent_path().filename());
 }
 
-// "00017-poster.webp"
-std::string PictureName(std::size_t number, const char* name, std::string_view type) {
-    return fmt::format("{:05}-{}.{}", number, name, type.substr(type.find('/') + 1));
-}
-
 }  // namespace
+
+std::string AdviceOnSize(std::uint64_t bytes, bool isSplit) {
+    constexpr std::uint64_t kMostBytes = 60'000'000;
+    return isSplit || bytes <= kMostBytes
+               ? std::string()
+               : fmt::format(
+                     "it has {:.0f} MB; --split makes a smaller one, with the pictures in a folder "
+                     "beside it",
+                     static_cast<double>(bytes) / 1e6);
+}
 
 void TakeCatalogs(ReportOptions& options) {
     std::vector<std::filesystem::path> paths;
@@ -95,9 +97,10 @@ void TakeCatalogs(ReportOptions& options) {
                             : options.title;
         options.catalogs.push_back({path, OpenCatalog(path, catalog::Catalog::For::Reading)});
         WithCatalog(path, [&] {
-            catalog::Statement select = options.catalogs.back().catalog.database().Prepare(
-                "SELECT path FROM movies ORDER BY path");
-            while (select.Step()) {
+            ReportOptions::NamedCatalog& named = options.catalogs.back();
+            catalog::Statement select =
+                named.catalog.database().Prepare("SELECT path FROM movies ORDER BY path");
+            for (; select.Step(); ++named.movies) {
                 paths.push_back(PathOfMachinePath(select.Text(0)));
             }
         });
@@ -118,10 +121,9 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
     takesPlace_ = std::filesystem::exists(file, ignored);
     output_.emplace(file);
     if (options.isSplit) {
-        folder_ = file;
-        folder_.replace_filename(file.stem());
-        folder_ += kEndingOfFolder;
-        madeFolder_.emplace(folder_);
+        std::filesystem::path folder = file;
+        folder.replace_filename(file.stem());
+        pictures_.emplace(folder += kEndingOfFolder);
     }
     page_.emplace(
         [this](std::string_view text) {
@@ -132,7 +134,7 @@ ReportRun::ReportRun(Session& session, ReportOptions& options)
 }
 
 // The page takes its place when all was read, so nothing that is read may lie there.
-void ReportRun::Planned(const MoviePlan&) {
+void ReportRun::Planned(const MoviePlan& plan) {
     const std::filesystem::path& page = options_.movies.together;
     std::vector<CallFile> read = {{"the list of movies", options_.movies.list}};
     for (const ReportOptions::NamedCatalog& one : options_.catalogs) {
@@ -140,6 +142,25 @@ void ReportRun::Planned(const MoviePlan&) {
     }
     RefuseOutputOnto(page, read);
     RefuseOntoMovie(page);
+    for (const ReportOptions::NamedCatalog& one : options_.catalogs) {
+        if (one.movies == 0) {
+            TellAlso(Failure(kExitFile, one.file, "the catalog holds no movie",
+                             "`cliphost catalog FOLDER -o FILE` puts movies into one"));
+        }
+    }
+    RefuseCatalogsOfList(plan);
+}
+
+// No movie begins as they do; without a list those of the call were taken already.
+void ReportRun::RefuseCatalogsOfList(const MoviePlan& plan) {
+    for (std::size_t i = 0; !options_.movies.list.empty() && i < plan.size(); ++i) {
+        const MovieStep step = plan[i];
+        if (step.IsMovie() && IsDatabase(step.movie)) {
+            RefuseMovie(i, Failure(kExitCaller, step.movie,
+                                   "this is a database, such as a catalog, and no movie",
+                                   "name a catalog on the command line, not in a list"));
+        }
+    }
 }
 
 MovieAnswer ReportRun::Answer(const MovieStep& step, const PlaceOfFile&) {
@@ -166,6 +187,9 @@ std::optional<catalog::Entry> ReportRun::EntryInCatalogs(const std::filesystem::
 }
 
 void ReportRun::ShowFailure(const std::filesystem::path& movie, const Problem& problem) {
+    if (notWritten_) {
+        throw Failure(*notWritten_);
+    }
     std::error_code ignored;
     if (std::filesystem::is_directory(movie, ignored)) {
         return;  // of movies, there are none in it
@@ -211,40 +235,28 @@ void ReportRun::Add(const std::filesystem::path& movie, Json clip, bool hasFaile
     if (options_.json) {
         facts["details"] = std::move(details);
     } else {
-        PutBeside(facts, kPoster);
-        PutBeside(details, kStrip);
-        page_->AddClip(clips_.size(), Dumped(details));
+        Write(facts, details);
     }
     clips_.push_back(std::move(facts));
 }
 
-// Puts a picture's bytes into a file of the folder, where there is one.
-void ReportRun::PutBeside(Json& owner, const char* name) {
-    const auto picture = owner.find(name);
-    if (folder_.empty() || picture == owner.end()) {
-        return;
+void ReportRun::Write(Json& facts, Json& details) {
+    try {
+        TakePictures(facts, details);
+        page_->AddClip(clips_.size(), Dumped(details));
+    } catch (const Failure& failure) {
+        notWritten_ = failure;
+        throw;
     }
-    const std::filesystem::path file =
-        folder_ / PictureName(clips_.size(), name, picture->value("type", std::string()));
-    const std::string bytes = report::FromBase64(picture->value("data", std::string()));
-    WriteWholeFile(file, {bytes.begin(), bytes.end()});
-    picture->erase("data");
-    (*picture)["file"] = host::text::PercentEncoded(
-        host::system::GenericPathText(folder_.filename() / file.filename()));
 }
 
-// Those of an earlier page with more clips.
-void ReportRun::RemoveOldPictures() const {
-    for (std::size_t number = clips_.size();; ++number) {
-        std::error_code ignored;
-        bool isThere = false;
-        for (const std::string& name :
-             {PictureName(number, kPoster, kWebp), PictureName(number, kPoster, kPng),
-              PictureName(number, kStrip, kWebp)}) {
-            isThere = std::filesystem::remove(folder_ / name, ignored) || isThere;
-        }
-        if (!isThere) {
-            return;
+void ReportRun::TakePictures(Json& facts, Json& details) {
+    if (!pictures_) {
+        return;
+    }
+    for (const auto& [owner, name] : {std::pair(&facts, "poster"), std::pair(&details, "strip")}) {
+        if (const auto picture = owner->find(name); picture != owner->end()) {
+            pictures_->Take(*picture, clips_.size(), name);
         }
     }
 }
@@ -263,10 +275,19 @@ void ReportRun::WritePage() {
     }
     const std::size_t count = document["clips"].size();
     page_->End(Dumped(WithSchema(schema::kReport, std::move(document))));
+    if (pictures_) {
+        pictures_->PutIntoPlace();
+    }
     output_->Finish();
+    if (pictures_) {
+        pictures_->RemoveOthers();
+    }
     if (!host::system::IsStandardOutput(options_.movies.together)) {
         fmt::print("{}: {}, {:.1f} MB\n", host::DisplayPath(options_.movies.together),
                    Counted(count, "clip"), static_cast<double>(written_) / 1e6);
+    }
+    if (const std::string advice = AdviceOnSize(written_, options_.isSplit); !advice.empty()) {
+        Notice("cliphost: {}: {}\n", host::DisplayPath(options_.movies.together), advice);
     }
 }
 
@@ -286,11 +307,9 @@ void ReportRun::Finish(int read, int) {
     } else if (IsStopped() && takesPlace_) {
         TellAlso(Failure(kExitFile, file, "left as it was: not all movies were read"));
     } else {
-        if (!folder_.empty()) {
-            RemoveOldPictures();
-        }
         WritePage();
     }
+    pictures_.reset();  // a signal that was held back ends the program soon
     TellUnusedMaps(read);
 }
 

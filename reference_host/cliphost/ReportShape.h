@@ -9,7 +9,7 @@ namespace cliphost {
 
 // What a report keeps of a clip, out of JSON that may come from a process that a movie has broken:
 // members that docs/json_schema/report.schema.json names, with values of their kind. Whatever else
-// is there is left out.
+// is there is left out, and so is what lacks something that the page needs.
 nlohmann::ordered_json ClipFrom(const std::string& json);
 
 }  // namespace cliphost

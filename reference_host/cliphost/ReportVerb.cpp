@@ -52,9 +52,10 @@ void AddReport(CLI::App& app, const SessionOptions& session, int& status) {
         "  cliphost report --files-from LIST -o report.html --split\n"
         "  cliphost report FOLDER --json > report.json\n\n"
         "The page holds all that it shows, so it can be sent or archived as it is, and asks no "
-        "network for\nanything. A path may be a catalog, which stands for the movies in it; what "
-        "it knows of a movie\nthat can't be read is shown. A movie that can't be described is in "
-        "the page too, with the reason.");
+        "network for\nanything. A path on the command line may be a catalog, which stands for the "
+        "movies in it; what it\nknows of a movie that can't be read is shown. A list names movies "
+        "and folders, and no catalogs. A\nmovie that can't be described is in the page too, with "
+        "the reason.");
     auto options = std::make_shared<ReportOptions>();
     auto* const output = AddPath(*verb, "-o,--output", options->movies.together,
                                  "The page, such as report.html, or - for standard output");

@@ -12,16 +12,22 @@
 #include "reference_host/cliphost/AafValue.h"
 #include "reference_host/cliphost/ListMatching.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/util/text/Cut.h"
 
 namespace cliphost {
 namespace {
 
+using host::text::IsInsideCharacter;
+using host::text::StartOf;
 using Kind = TreeDifference::Kind;
 
 // What says when, or by whom, an object was written.
 constexpr const char* kLeftOut[] = {"CreationTime", "Generation", "LastModified"};
 
 constexpr char kSlotId[] = "SlotID";
+
+// What names slots elsewhere, which may have other numbers now.
+constexpr const char* kSlotReferences[] = {"LinkedSlotID", "SourceMobSlotID"};
 
 // The properties by which an object of a list is found again; the first that it has counts.
 constexpr const char* kKeys[] = {kSlotId, "Identification", "Definition", "Name"};
@@ -34,8 +40,13 @@ constexpr std::size_t kShownBefore = 30;  // of what two long values have in com
 // Objects with no more facts are told whole.
 constexpr std::size_t kFewFacts = 2;
 
+template <std::size_t count>
+bool IsOneOf(const char* const (&names)[count], const std::string& name) {
+    return std::find(std::begin(names), std::end(names), name) != std::end(names);
+}
+
 bool IsLeftOut(const std::string& name) {
-    return std::find(std::begin(kLeftOut), std::end(kLeftOut), name) != std::end(kLeftOut);
+    return IsOneOf(kLeftOut, name);
 }
 
 const TreeNode::Fact* FindFact(const TreeNode& node, std::string_view name) {
@@ -59,7 +70,7 @@ std::string KindOfData(const TreeNode& node) {
     const std::size_t id = data.find('{');
     const std::string kind =
         id == std::string::npos ? std::string() : KindOfDataNamed(data.substr(id));
-    return kind.empty() ? data.substr(0, data.find(" {")) : kind;
+    return kind.empty() ? Shown(data.substr(0, data.find(" {"))) : kind;
 }
 
 std::string KindOfSlot(const TreeNode& slot) {
@@ -108,10 +119,10 @@ public:
         const TreeNode& node = list_.nodes[at];
         const TreeNode::Fact* const key = KeyOf(node);
         if (key == nullptr) {
-            return fmt::format("{} {} ({})", Ordinal(at + 1), OneOf(list_.name), node.title);
+            return fmt::format("{} {} ({})", Ordinal(at + 1), OneOf(list_.name), Shown(node.title));
         }
         if (key->name != kSlotId) {
-            return fmt::format("{} {}", OneOf(list_.name), key->value);
+            return fmt::format("{} {}", OneOf(list_.name), Shown(key->value));
         }
         if (ordinals_[at] == 0) {
             return fmt::format("slot {}", key->value);
@@ -133,11 +144,11 @@ std::size_t Mixed(std::size_t hash, std::string_view text) {
     return (hash ^ std::hash<std::string_view>()(text)) * kFactor;
 }
 
-// Equal for equal objects, but perhaps for their keys.
+// Equal for equal objects, but perhaps for their keys and the numbers of slots.
 std::size_t HashOf(const TreeNode& node, const TreeNode::Fact* key) {
     std::size_t hash = Mixed(node.facts.size(), node.title);
     for (const TreeNode::Fact& fact : node.facts) {
-        if (&fact != key && !IsLeftOut(fact.name)) {
+        if (&fact != key && !IsLeftOut(fact.name) && !IsOneOf(kSlotReferences, fact.name)) {
             hash = Mixed(Mixed(hash, fact.name), fact.value);
         }
     }
@@ -175,22 +186,12 @@ std::string Brief(const TreeNode& node) {
     return count > 0 && count <= kFewFacts && node.branches.empty() ? text : node.title;
 }
 
-bool IsInsideCharacter(const std::string& text, std::size_t at) {
-    return at < text.size() && (static_cast<unsigned char>(text[at]) & 0xC0) == 0x80;
-}
-
 // A piece of a value from `start` on.
 std::string Piece(const std::string& value, std::size_t start) {
-    std::size_t end = std::min(value.size(), start + kLongestValue);
-    while (IsInsideCharacter(value, end)) {
-        --end;
-    }
-    return fmt::format("{}{}{}", start > 0 ? "..." : "", value.substr(start, end - start),
-                       end < value.size() ? "..." : "");
-}
-
-std::string Shown(const std::string& value) {
-    return Piece(value, 0);
+    const std::string_view rest = std::string_view(value).substr(start);
+    const std::string_view piece = StartOf(rest, kLongestValue);
+    return fmt::format("{}{}{}", start > 0 ? "..." : "", piece,
+                       piece.size() < rest.size() ? "..." : "");
 }
 
 // Two values so that it is seen in what they differ.
@@ -214,12 +215,17 @@ bool IsUnread(const std::string& value) {
 
 }  // namespace
 
+std::string Shown(const std::string& value) {
+    return Piece(value, 0);
+}
+
 const char* NameOf(Kind kind) {
-    constexpr const char* kNames[] = {"changed", "gone", "new", "reordered"};
+    constexpr const char* kNames[] = {"changed", "gone", "new", "reordered", "notDescribed"};
     return kNames[static_cast<std::size_t>(kind)];
 }
 
-std::string PropertyWords(const std::string& name) {
+std::string PropertyWords(const std::string& property) {
+    const std::string name = Shown(property);
     const auto isUpper = [&](std::size_t i) {
         return i < name.size() && name[i] >= 'A' && name[i] <= 'Z';
     };
@@ -242,7 +248,8 @@ std::string InWords(const TreeDifference& difference) {
         text += (text.empty() ? "" : ": ") + place;
     }
     const auto in = [](const std::optional<std::string>& object) {
-        return object->find(' ') == std::string::npos ? "" : fmt::format(" ({})", Shown(*object));
+        const bool saysMore = object && object->find(' ') != std::string::npos;
+        return saysMore ? fmt::format(" ({})", Shown(*object)) : std::string();
     };
     switch (difference.kind) {
         case Kind::Gone:
@@ -252,6 +259,8 @@ std::string InWords(const TreeDifference& difference) {
         case Kind::Reordered:
             return fmt::format("{}{}{} in another order", text, text.empty() ? "" : ": ",
                                PropertyWords(difference.property));
+        case Kind::Unknown:
+            return fmt::format("{} not described: {}", text, difference.reason);
         case Kind::Changed:
             break;
     }

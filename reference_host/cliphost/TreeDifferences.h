@@ -19,6 +19,7 @@ struct TreeDifference {
         Gone,       // an object
         New,        // an object
         Reordered,  // objects of a list that is no set
+        Unknown,    // an object that could not be looked at; no difference
     };
     Kind kind = Kind::Changed;
     // For people, from the outside in: {"picture slot 1", "second component (SourceClip)"}.
@@ -26,14 +27,18 @@ struct TreeDifference {
     std::string property;               // as the file names it, where a property changed
     std::optional<std::string> before;  // values as a tree has them, or what was there in words
     std::optional<std::string> after;
+    std::string reason;  // why nothing is known
 };
 const char* NameOf(TreeDifference::Kind kind);
 // "picture slot 1: length 250 -> 251", "second timecode slot (2) gone". Long values are cut to
 // where they begin to differ.
 std::string InWords(const TreeDifference& difference);
 
+// A name or value for people, cut where it is long.
+std::string Shown(const std::string& value);
+
 // "EditRate" -> "edit rate"
-std::string PropertyWords(const std::string& name);
+std::string PropertyWords(const std::string& property);
 
 // Compares trees of objects, property by property. Objects in a list are those with the same key,
 // such as a slot's id or a name; the rest go by their content, and then by their order. What says

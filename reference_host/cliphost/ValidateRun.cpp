@@ -6,7 +6,9 @@
 
 #include <algorithm>
 #include <chrono>
+#include <csignal>
 #include <cstdio>
+#include <iterator>
 #include <memory>
 #include <optional>
 
@@ -64,6 +66,33 @@ Failure NoFolder(const std::filesystem::path& parent, const std::error_code& err
     return {kExitCaller, parent,
             "no folder can be made there: " + error.default_error_condition().message(),
             "name another one in TMPDIR"};
+}
+
+// What most likely ends a process so.
+struct CauseOfEnd {
+    int signal;
+    const char* words;
+};
+constexpr CauseOfEnd kCausesOfEnd[] = {
+    {SIGSEGV, "a pointer is used that is null, or that leads to something that is gone"},
+    {SIGBUS, "a pointer is used that leads nowhere, or a mapped file has become shorter"},
+    {SIGABRT,
+     "an exception that nobody catches, an assertion, or memory that was written beyond its end "
+     "or freed twice"},
+    {SIGFPE, "a whole number is divided by zero"},
+    {SIGILL, "an instruction that this processor does not have, or a trap of the compiler's"},
+    {SIGKILL, "the system ended it, for want of memory perhaps"},
+};
+
+std::string WhyItEnded(const host::system::ProcessEnd& end) {
+    if (end.signal == 0) {
+        return "the module, or a library that it uses, ends the whole process (exit)";
+    }
+    const auto* const found =
+        std::find_if(std::begin(kCausesOfEnd), std::end(kCausesOfEnd),
+                     [&](const CauseOfEnd& cause) { return cause.signal == end.signal; });
+    return found == std::end(kCausesOfEnd) ? "something sends the process this signal"
+                                           : found->words;
 }
 
 // A folder that is there for one check.
@@ -158,16 +187,18 @@ private:
         // A fault that the check has found explains more than what came after it.
         const bool isBadEnd = end.signal != 0 || end.status != 0;
         if (!hasOutcome_ || (isBadEnd && !IsFault(outcome_.verdict))) {
-            const std::string causeOfEnd =
-                hasOutcome_ ? "a global object's destructor uses something that is gone, or memory "
-                              "was damaged before"
-                            : check_.cause;
+            // What the check looks for often is what has come to this.
+            const std::string cause =
+                WhyItEnded(end) + "; " +
+                (hasOutcome_
+                     ? "a global object's destructor does it, or memory was damaged before"
+                     : fmt::format("behind it may be what this check looks for: {}", check_.cause));
             outcome_.done = hasOutcome_ ? "ending the process after the check" : outcome_.done;
             End(Verdict::kCrashed, "the module comes back",
                 (end.signal != 0 ? fmt::format("its process was ended by signal {}", end.signal)
                                  : fmt::format("its process ended with status {}", end.status)) +
                     LastWords(),
-                causeOfEnd);
+                cause);
         }
         isDone_ = true;
     }

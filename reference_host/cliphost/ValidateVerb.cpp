@@ -140,6 +140,8 @@ public:
         hasFault_ = hasFault_ || IsFault(verdict);
     }
     bool HasFault() const { return hasFault_; }
+    // A run in which nothing was found, since nothing was looked at.
+    bool IsOfSkippedAlone() const { return counts_.size() == 1 && Count(Verdict::kSkipped) > 0; }
     // "84 checks: 80 passed, 1 failed, ..."
     std::string Line() const {
         std::uint64_t all = 0;
@@ -240,6 +242,12 @@ int Validate(ValidateOptions& options, const SessionOptions& session) {
         fmt::print("{}\n", tally.Line());
     }
     FlushAnswer();
+    if (tally.IsOfSkippedAlone()) {
+        TellProblem({call.module, "nothing was checked: all checks were skipped, and say why",
+                     "give a module that has what they are about, or leave --only out"},
+                    session.verbosity);
+        return kExitCaller;
+    }
     return tally.HasFault() ? kExitFile : kExitFine;
 }
 
@@ -283,7 +291,8 @@ void AddValidate(CLI::App& app, const SessionOptions& session, int& status) {
         "may have any components:\nchecks of volumes and containers are skipped where it has "
         "none. The movies that a module is given are made for\nthe check.\n\n"
         "Exit status: 0, nothing is wrong, though there may be warnings; 1, a check failed, "
-        "crashed or timed out; 2, the call\nis at fault.");
+        "crashed or timed out; 2, the call\nis at fault, or all checks were skipped, so that "
+        "nothing is known.");
     const auto options = std::make_shared<ValidateOptions>();
     options->call.worker.limits = {kUsualSeconds, kUsualMebibytes};
     options->call.seed = std::random_device()();

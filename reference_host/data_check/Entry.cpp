@@ -7,6 +7,9 @@
 #include <algorithm>
 #include <charconv>
 #include <numeric>
+#include <system_error>
+
+#include "reference_host/util/text/Cut.h"
 
 namespace data_check {
 namespace {
@@ -17,7 +20,6 @@ using host::PlacedElement;
 // Its blanks count.
 constexpr std::string_view kCode = "FourChar";
 
-constexpr std::size_t kLongestNumber = 9;     // in digits; one of 32 bits takes it
 constexpr std::size_t kLongestShown = 60;     // of a value or name
 constexpr std::size_t kLongestCompared = 64;  // of names
 constexpr std::size_t kLikeness = 2;          // letters in which a mistyped name may differ
@@ -26,10 +28,6 @@ bool HasOuterBlank(const std::string& text) {
     constexpr const char* kBlanks = " \t\r\n";
     return text.empty() || text.find_first_of(kBlanks) == 0 ||
            text.find_last_of(kBlanks) == text.size() - 1;
-}
-
-std::string Shown(const std::string& text) {
-    return text.size() <= kLongestShown ? text : text.substr(0, kLongestShown) + "...";
 }
 
 // How many letters have to be put in, taken out or changed.
@@ -57,8 +55,11 @@ std::string HintFor(const std::string& name, const std::vector<const char*>& kno
     for (const char* const one : known) {
         all += (all.empty() ? "" : ", ") + std::string(one);
     }
-    return all.empty() ? "take it out: the value itself stands here"
-                       : fmt::format("take it out; the module reads: {}", all);
+    return fmt::format("take it out; the module reads: {}", all);
+}
+
+std::string HintFor(const NumberRule& rule) {
+    return fmt::format("give {}", rule.accepted);
 }
 
 void CheckName(const EntryReader& reader, const std::string& name, host::XmlPlace place,
@@ -69,7 +70,35 @@ void CheckName(const EntryReader& reader, const std::string& name, host::XmlPlac
     }
 }
 
+// Finds entries as the module does: wherever they stand, whatever is around them.
+struct EntrySearch {
+    std::string_view name;
+    std::vector<const PlacedElement*> entries = {};
+    std::vector<const PlacedElement*> strangers = {};  // the outermost elements without an entry
+
+    void Enter(const PlacedElement& element) {
+        if (element.name == name) {
+            entries.push_back(&element);
+            return;
+        }
+        const std::size_t entriesBefore = entries.size();
+        const std::size_t strangersBefore = strangers.size();
+        for (const PlacedElement& child : element.elements) {
+            Enter(child);
+        }
+        if (entries.size() == entriesBefore) {
+            strangers.resize(strangersBefore);
+            strangers.push_back(&element);
+        }
+    }
+};
+
 }  // namespace
+
+std::string Shown(const std::string& text) {
+    const std::string start(host::text::StartOf(text, kLongestShown));
+    return start.size() == text.size() ? start : start + "...";
+}
 
 std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
     std::vector<Item> items;
@@ -80,7 +109,7 @@ std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
     }
     for (const PlacedElement& child : parent.elements) {
         if (child.name == name) {
-            items.push_back({child.text, child.place});
+            items.push_back({child.text, child.place, &child});
         }
     }
     return items;
@@ -89,13 +118,14 @@ std::vector<Item> ItemsOf(const PlacedElement& parent, std::string_view name) {
 std::optional<std::uint32_t> NumberIn(const std::string& text) {
     std::uint32_t number = 0;
     const char* const end = text.data() + text.size();
+    const auto [last, error] = std::from_chars(text.data(), end, number);
     const bool isPlain =
-        !text.empty() && text.size() <= kLongestNumber &&
-        std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; }) &&
-        (text.size() == 1 || text[0] != '0');
-    return isPlain && std::from_chars(text.data(), end, number).ptr == end
-               ? std::optional<std::uint32_t>(number)
-               : std::nullopt;
+        error == std::errc() && last == end && (text.size() == 1 || text[0] != '0');
+    return isPlain ? std::optional<std::uint32_t>(number) : std::nullopt;
+}
+
+bool IsId(std::uint32_t number) {
+    return number != 0 && number <= 0x7FFFFFFF;
 }
 
 std::optional<Item> EntryReader::One(const PlacedElement& parent, const char* name,
@@ -110,7 +140,23 @@ std::optional<Item> EntryReader::One(const PlacedElement& parent, const char* na
              "take out all but one; the first counts");
         return std::nullopt;
     }
-    return std::move(items[0]);
+    return IsSound(items[0], name) ? std::optional<Item>(std::move(items[0])) : std::nullopt;
+}
+
+// The module takes what follows the name of a value for the value: an attribute, then the text.
+bool EntryReader::IsSound(const Item& item, const char* name) const {
+    if (item.element != nullptr && !item.element->attributes.empty()) {
+        const PlacedAttribute& first = item.element->attributes[0];
+        Tell(first.place, fmt::format("{} would get the value of {}", name, Shown(first.name)),
+             "take the attribute out: the value itself stands in the element");
+        return false;
+    }
+    if (name != kCode && HasOuterBlank(item.value)) {
+        Tell(item.place, fmt::format("{} is empty or has blanks around it", name),
+             "write the value with nothing around it; the module takes blanks for a part of it");
+        return false;
+    }
+    return true;
 }
 
 std::optional<std::uint32_t> EntryReader::Number(const PlacedElement& parent,
@@ -118,14 +164,20 @@ std::optional<std::uint32_t> EntryReader::Number(const PlacedElement& parent,
     if (!rule.isMandatory && ItemsOf(parent, rule.name).empty()) {
         return std::nullopt;
     }
-    const std::string hint = fmt::format("give {}", rule.accepted);
-    const std::optional<Item> item = One(parent, rule.name, hint);
-    if (!item) {
-        return std::nullopt;
-    }
-    const std::optional<std::uint32_t> number = NumberIn(item->value);
+    const std::optional<Item> item = One(parent, rule.name, HintFor(rule));
+    return item ? CheckedNumber(*item, rule) : std::nullopt;
+}
+
+std::optional<std::uint32_t> EntryReader::NumberOf(const Item& item, const NumberRule& rule) const {
+    return IsSound(item, rule.name) ? CheckedNumber(item, rule) : std::nullopt;
+}
+
+std::optional<std::uint32_t> EntryReader::CheckedNumber(const Item& item,
+                                                        const NumberRule& rule) const {
+    const std::optional<std::uint32_t> number = NumberIn(item.value);
     if (!number || !rule.accepts(*number)) {
-        Tell(item->place, fmt::format("{} can't be \"{}\"", rule.name, Shown(item->value)), hint);
+        Tell(item.place, fmt::format("{} can't be \"{}\"", rule.name, Shown(item.value)),
+             HintFor(rule));
         return std::nullopt;
     }
     return number;
@@ -158,43 +210,22 @@ void EntryReader::CheckNames(const PlacedElement& parent,
     }
 }
 
-void EntryReader::CheckBlanks(const PlacedElement& element) const {
-    const auto check = [&](const std::string& name, const std::string& value,
-                           host::XmlPlace place) {
-        if (name != kCode && HasOuterBlank(value)) {
-            Tell(
-                place, fmt::format("{} is empty or has blanks around it", name),
-                "write the value with nothing around it; the module takes blanks for a part of it");
-        }
-    };
-    for (const PlacedAttribute& attribute : element.attributes) {
-        check(attribute.name, attribute.value, attribute.place);
-    }
-    if (element.attributes.empty() && element.elements.empty()) {
-        check(element.name, element.text, element.place);
-    }
-    for (const PlacedElement& child : element.elements) {
-        CheckBlanks(child);
-    }
-}
-
 std::vector<const PlacedElement*> EntriesOf(const PlacedElement& root, const char* name,
                                             const EntryReader& reader) {
-    std::vector<const PlacedElement*> entries;
     if (root.name == name) {
         return {&root};
     }
+    EntrySearch search{name};
     for (const PlacedElement& child : root.elements) {
-        if (child.name == name) {
-            entries.push_back(&child);
-        } else {
-            CheckName(reader, child.name, child.place, {name});
-        }
+        search.Enter(child);
     }
-    if (entries.empty()) {
+    for (const PlacedElement* const stranger : search.strangers) {
+        CheckName(reader, stranger->name, stranger->place, {name});
+    }
+    if (search.entries.empty()) {
         reader.Tell(root.place, fmt::format("there is no {} in it", name), "add one");
     }
-    return entries;
+    return std::move(search.entries);
 }
 
 }  // namespace data_check

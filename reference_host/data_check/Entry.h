@@ -13,6 +13,7 @@ namespace data_check {
 struct Item {
     std::string value;
     host::XmlPlace place;
+    const host::PlacedElement* element = nullptr;  // none: it is an attribute
 };
 
 // Which numbers a value may be.
@@ -31,30 +32,39 @@ public:
     void Tell(host::XmlPlace place, std::string what, std::string hint) const {
         findings_.Tell(file_, place, std::move(what), std::move(hint));
     }
-    // The only item of a name. Without one, or with several, that is told, and nothing given.
+    // The only item of a name. Without one, with several, or with one that can't be a value, that
+    // is told, and nothing given.
     std::optional<Item> One(const host::PlacedElement& parent, const char* name,
                             const std::string& hint) const;
     // The number of an item; nothing where it lacks, which is told where it must not, or is wrong.
     std::optional<std::uint32_t> Number(const host::PlacedElement& parent,
                                         const NumberRule& rule) const;
+    // The same of an item that is there.
+    std::optional<std::uint32_t> NumberOf(const Item& item, const NumberRule& rule) const;
     // The only child of a name. The same.
     const host::PlacedElement* OneChild(const host::PlacedElement& parent, const char* name,
                                         const std::string& hint) const;
     // Tells attributes and children that are none of these.
     void CheckNames(const host::PlacedElement& parent, const std::vector<const char*>& known) const;
-    // Tells values that begin or end with blanks, or are empty.
-    void CheckBlanks(const host::PlacedElement& element) const;
 
 private:
+    // Whether nothing keeps an item from being a value; what does is told.
+    bool IsSound(const Item& item, const char* name) const;
+    std::optional<std::uint32_t> CheckedNumber(const Item& item, const NumberRule& rule) const;
+
     DataFile file_;
     Findings& findings_;
 };
 
+// A value for a text about it, in which it is cut where it is long.
+std::string Shown(const std::string& text);
 std::vector<Item> ItemsOf(const host::PlacedElement& parent, std::string_view name);
 // A whole number as the module compares it: no sign, no zeros before it.
 std::optional<std::uint32_t> NumberIn(const std::string& text);
-// The entries of a name in a document, which may be one itself. What else stands beside them is
-// told.
+// Whether the module can find a record by this id: it writes ids as signed numbers.
+bool IsId(std::uint32_t number);
+// The entries of a name in a document, which may be one itself; like the module, in other elements
+// too. What else stands beside them is told.
 std::vector<const host::PlacedElement*> EntriesOf(const host::PlacedElement& root, const char* name,
                                                   const EntryReader& reader);
 

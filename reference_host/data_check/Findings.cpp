@@ -8,17 +8,25 @@
 namespace data_check {
 
 void Findings::Tell(DataFile file, host::XmlPlace place, std::string what, std::string hint) {
-    if (count_++ < kMost) {
-        kept_.push_back({file, place, std::move(what), std::move(hint)});
+    ++count_;
+    kept_.push_back({file, place, std::move(what), std::move(hint)});
+    if (kept_.size() == 2 * kMost) {
+        KeepFirst();
     }
 }
 
 std::vector<Finding> Findings::TakeInOrder() {
+    KeepFirst();
+    return std::move(kept_);
+}
+
+void Findings::KeepFirst() {
     std::stable_sort(kept_.begin(), kept_.end(), [](const Finding& a, const Finding& b) {
         return std::tie(a.file, a.place.line, a.place.column) <
                std::tie(b.file, b.place.line, b.place.column);
     });
-    return std::move(kept_);
+    kept_.erase(kept_.begin() + static_cast<std::ptrdiff_t>(std::min(kMost, kept_.size())),
+                kept_.end());
 }
 
 }  // namespace data_check

@@ -24,8 +24,8 @@ struct Finding {
     std::string hint;  // what helps
 };
 
-// All of a check. A file may be nothing but mistakes, so no more than kMost are kept; the rest is
-// counted.
+// All of a check. A file may be nothing but mistakes, so the first kMost are kept, by their places;
+// the rest is counted.
 class Findings {
 public:
     static constexpr std::size_t kMost = 1000;
@@ -36,7 +36,9 @@ public:
     std::vector<Finding> TakeInOrder();
 
 private:
-    std::vector<Finding> kept_;
+    void KeepFirst();
+
+    std::vector<Finding> kept_;  // twice as many at most
     std::size_t count_ = 0;
 };
 

@@ -17,6 +17,10 @@ namespace {
 constexpr std::uint32_t kFirstMovieId = 10900;
 constexpr std::uint32_t kLastMovieId = 10999;
 
+bool IsMovieId(std::uint32_t id) {
+    return id >= kFirstMovieId && id <= kLastMovieId;
+}
+
 // How codes begin that fix the size of a picture, so that their ids may do with one record.
 constexpr std::string_view kFixedRasters[] = {"dv", "mx", "xd", "hdv", "ai"};
 
@@ -86,11 +90,37 @@ private:
         for (std::size_t i = 0; rows.size() > 1 && i < rasters.size(); ++i) {
             CheckRaster(*rows.back(), rasters[i]);
         }
-        if (!leadsSomewhere) {
+        if (!leadsSomewhere && !rasters.empty()) {
             TellRow(*rows.front(), fmt::format("code \"{}\" leads to no id", code),
-                    rasters.empty() ? "give it a vcid"
-                                    : "give the code a second row, so that the module's own table "
-                                      "of its rasters is asked");
+                    "give the code a second row, so that the module's own table of its rasters is "
+                    "asked");
+        } else if (!leadsSomewhere && !HasMovieIds()) {
+            TellRow(*rows.front(), fmt::format("code \"{}\" leads to no id", code),
+                    fmt::format("give it a vcid, or AAFInfo.xml a record with an id of those that "
+                                "movies name themselves, {} to {}",
+                                kFirstMovieId, kLastMovieId));
+        }
+        CheckRepeats(rows, !rasters.empty());
+    }
+
+    // Whether a movie that names its id itself finds a record; of a file with mistakes nobody
+    // knows.
+    bool HasMovieIds() const {
+        const auto first = ids_.lower_bound(kFirstMovieId);
+        return !infosAreWhole_ || (first != ids_.end() && IsMovieId(first->first));
+    }
+
+    // Of rows without an id. A code of the module's table needs two of them.
+    void CheckRepeats(const Rows& rows, bool hasTable) {
+        std::set<std::optional<std::string>> vendors;
+        for (std::size_t i = 0; i < rows.size(); ++i) {
+            const MapperRow& row = *rows[i];
+            const bool counts = row.id == 0 || row.vendor;
+            const bool isRepeat = counts && !vendors.insert(row.vendor).second && row.id == 0;
+            if (isRepeat && !(hasTable && i == 1)) {
+                TellRow(row, fmt::format("this row of \"{}\" serves no movie", row.code),
+                        "take it out: one before it counts");
+            }
         }
     }
 
@@ -138,8 +168,7 @@ private:
     }
 
     void CheckId(std::uint32_t id, const RecordsOfId& records) {
-        const bool isByMovie = id >= kFirstMovieId && id <= kLastMovieId;
-        const bool isReached = reached_.count(id) > 0 || isByMovie;
+        const bool isReached = reached_.count(id) > 0 || IsMovieId(id);
         if (!isReached && mapperIsWhole_) {
             TellRecord(*records.front(), fmt::format("no code leads to id {}", id),
                        fmt::format("add a row with vcid {} to FourCharMapper.xml, or take the "
@@ -156,6 +185,26 @@ private:
         }
     }
 
+    static const char* HintForShadow(const Record& before, const Record& record) {
+        if (before.values == record.values) {
+            return "take this one out, it is a repeat";
+        }
+        if (HasSamePicture(before, record)) {
+            return "make the two alike, or take the wrong one out: they differ, and the first "
+                   "counts";
+        }
+        return FindsFirst(record, before)
+                   ? "give one of the two another id: each takes the other's pictures, in any order"
+                   : "put this one before it: larger heights come first";
+    }
+
+    // Whether a picture of the second one would find the first one before it.
+    static bool FindsFirst(const Record& first, const Record& second) {
+        const RecordsOfId both = {&first, &second};
+        return FindRecord(both, second.storedWidth, second.displayHeight) == 0u ||
+               FindRecord(both, second.sampledWidth, second.displayHeight) == 0u;
+    }
+
     // A record is to be found by a picture of its own size, by either width.
     void CheckShadow(const RecordsOfId& records, std::size_t at) {
         const Record& record = *records[at];
@@ -163,16 +212,14 @@ private:
             const std::optional<std::size_t> found =
                 FindRecord(records, width, record.displayHeight);
             // A repeat of the only record makes heights count.
-            const bool isRepeat = records.size() == 2 && HasSamePicture(*records[0], record);
+            const bool isRepeat = records.size() == 2 && records[0]->values == record.values;
             if (found && *found != at && !isRepeat) {
                 TellRecord(record,
                            fmt::format("a picture of {}x{} finds the record of id {} in line {} "
                                        "instead of this one",
                                        width, record.displayHeight, record.id,
                                        records[*found]->place.line),
-                           HasSamePicture(*records[*found], record)
-                               ? "take this one out, it is a repeat"
-                               : "put this one before it: larger heights come first");
+                           HintForShadow(*records[*found], record));
                 return;
             }
         }

@@ -15,6 +15,7 @@ struct Record {
     std::uint32_t displayHeight = 0;
     std::uint32_t layout = 0;
     host::XmlPlace place;
+    std::string values;  // all that it says, in an order of its own, to find repeats by
 };
 
 struct Records {

@@ -3,6 +3,7 @@
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/ProcessFacts.h"
 #include "reference_host/util/text/HostText.h"
+#include "reference_host/validate/Locks.h"
 #include "reference_host/validate/Media.h"
 
 namespace validate {
@@ -92,6 +93,34 @@ void NeedsAPath(Trial& trial) {
     trial.Expect((result >= 0) == static_cast<bool>(mapping),
                  "a mapping with success, or null with a failure",
                  trial.Text(result) + (mapping ? ", and a mapping" : ", and null"));
+}
+
+void ContainerRefusesNull(Trial& trial) {
+    Containers containers(trial);
+    const auto container = containers.New();
+    trial.Doing("calling SetFilePath with null for the path");
+    trial.ExpectRefusal(container->SetFilePath(nullptr));
+    trial.Doing("calling GetCapabilities with null for the output");
+    trial.ExpectRefusal(container->GetCapabilities(nullptr));
+    const auto whole = containers.Open(WriteSoundMovie(trial.folder()).file);
+    trial.Doing("calling GetAAFMasterClips with null for the output");
+    trial.ExpectRefusal(whole->GetAAFMasterClips(nullptr));
+    trial.Doing("calling GetSampleMapping with null for the output");
+    trial.ExpectRefusal(whole->GetSampleMapping(nullptr));
+}
+
+void GivesLocksBack(Trial& trial) {
+    LockCalls calls;  // outlives the module's host
+    Containers containers(trial, [&](host::Host& host) { RegisterCountingLocks(host, calls); });
+    const SampleMovie movie = WriteSoundMovie(trial.folder());
+    DescribeAnything(containers, movie);
+    trial.Doing("counting the locks that were taken while a movie was described");
+    ExpectGivenBack(trial, calls);
+    for (const SampleMovie& broken : WriteBrokenMovies(trial.folder())) {
+        DescribeAnything(containers, broken);
+        trial.Doing("counting the locks that were taken for a file: " + broken.about);
+        ExpectGivenBack(trial, calls);
+    }
 }
 
 void RefusesMissingFiles(Trial& trial) {
@@ -251,6 +280,11 @@ std::vector<Check> ContainerChecks() {
          "the host's string is kept instead of its text", CopiesThePath},
         {"container-without-path", "A container without a path refuses to describe.",
          "the path is used before it is looked at", NeedsAPath},
+        {"container-null-arguments", "A container refuses null for a path and for an output.",
+         "the argument is used before it is looked at", ContainerRefusesNull},
+        {"container-locks",
+         "A description gives each lock of the host's back that it takes, and so does a refusal.",
+         "a way out of a function passes over the Unlock", GivesLocksBack},
         {"container-missing-file", "A container refuses a file that is not there, and a folder.",
          "the file is not opened before the description is made", RefusesMissingFiles},
         {"container-supports", "What a container describes it also supports.",

@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include <random>
 
+#include "reference_host/framework/HostPath.h"
 #include "reference_host/system/ProcessFacts.h"
 #include "reference_host/validate/KnownInterfaces.h"
 #include "reference_host/validate/Media.h"
@@ -95,6 +96,34 @@ void BrokenFilesLeaveNothing(Trial& trial) {
     const SampleMovie movie = WriteBrokenMovies(trial.folder())[2];
     ExpectNothingLeft(trial, "describing a file that is no movie",
                       [&] { Describe(trial, containers.Open(movie.file).get()); });
+}
+
+void MappingsLeaveNothing(Trial& trial) {
+    Containers containers(trial);
+    const SampleMovie movie = WriteSoundMovie(trial.folder());
+    ExpectNothingLeft(trial, "asking for a movie's sample mapping", [&] {
+        const auto container = containers.Open(movie.file);
+        host::Ref<NMA::ISampleMapping> mapping;
+        if (container->GetSampleMapping(mapping.Out()) >= 0 && mapping) {
+            ncfUInt64 samples = 0;
+            mapping->GetNumberOfSamples(0, &samples);
+        }
+    });
+}
+
+void VolumesLeaveNothing(Trial& trial) {
+    Volumes volumes(trial);
+    const auto path = host::ModulePath(volumes.folder());
+    ExpectNothingLeft(trial, "asking a volume for a folder's info and clips", [&] {
+        volumes.Claims(volumes.folder());
+        host::Ref<NMA::IVolumeInfo> info;
+        volumes.volume()->GetVolumeInfo(path.get(), info.Out());
+        host::Ref<INCFString> label;
+        info->GetLabel(label.Out());
+        const auto clips = volumes.ClipsOf(volumes.folder());
+        const auto text = host::MakeRef<host::String>();
+        clips->GetClipPath(0, text.get());
+    });
 }
 
 // Calls in an order that the seed chooses, with objects that live for a while.
@@ -196,6 +225,10 @@ std::vector<Check> EnduranceChecks() {
          RefusedCreationsLeaveNothing},
         {"leaks-descriptions", "Describing a movie 1000 times leaves nothing behind.", kLeak,
          DescriptionsLeaveNothing},
+        {"leaks-mappings", "1000 sample mappings of a movie leave nothing behind.", kLeak,
+         MappingsLeaveNothing},
+        {"leaks-volumes", "Asking a volume for a folder 1000 times leaves nothing behind.", kLeak,
+         VolumesLeaveNothing},
         {"leaks-broken-files", "Refusing a file 1000 times leaves nothing behind.", kLeak,
          BrokenFilesLeaveNothing},
         {"fuzz-calls",

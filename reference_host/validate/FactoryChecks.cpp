@@ -115,6 +115,28 @@ void FactoryRefusesUnloading(Trial& trial) {
     });
 }
 
+void EachFactoryCounts(Trial& trial) {
+    constexpr int kFactories = 3;
+    Module module(trial);
+    module.Start();
+    ForEachFactory(module, [&](Made& made) {
+        made.factory.Reset();
+        std::vector<host::Ref<INCFClassFactory>> factories;
+        for (int number = 1; number <= kFactories; ++number) {
+            trial.Doing("getting class factory " + std::to_string(number) + " of " + made.name);
+            factories.push_back(FactoryOf(module, made.component));
+            trial.Expect(static_cast<bool>(factories.back()), "a class factory each time", "none");
+        }
+        for (int left = kFactories; left > 0; --left) {
+            trial.Doing("calling NCFCanUnloadNow while " + std::to_string(left) +
+                        " class factories of " + made.name + " live");
+            trial.ExpectRefusal(module.canUnloadNow(module.unknown()), "unloading is refused");
+            factories.pop_back();
+        }
+        ExpectIdle(module, "once the last class factory of " + made.name + " is released");
+    });
+}
+
 void ObjectOutlivesFactory(Trial& trial) {
     Module module(trial);
     module.Start();
@@ -299,6 +321,10 @@ std::vector<Check> FactoryChecks() {
          "A class factory counts as alive: while the host keeps one, the module can't be "
          "unloaded.",
          "the counter of objects leaves class factories out", FactoryRefusesUnloading},
+        {"factory-counted-each",
+         "Class factories keep the module each by itself: of several, the last one that is "
+         "released allows unloading.",
+         "a flag stands in place of a counter, or all share one reference", EachFactoryCounts},
         {"factory-released-first", "An object goes on when its class factory is released.",
          "the object belongs to its class factory", ObjectOutlivesFactory},
         {"create-null-host", "CreateInstance with null for the host makes an object or refuses.",

@@ -108,7 +108,27 @@ void RefusesOtherTracks(Trial& trial) {
         trial.ExpectRefusal(mapping->GetNumberOfSamples(track, &number));
         trial.ExpectRefusal(mapping->GetSamplePosition(track, 0, &number));
         trial.ExpectRefusal(mapping->GetSampleSize(track, 0, &number));
+        ncfUInt32 count = 0;
+        trial.ExpectRefusal(mapping->GetNumberOfChannels(track, &count));
+        trial.ExpectRefusal(mapping->GetSampleProperties(track, 0, &number, &count));
+        ncfSInt64 offset = 0;
+        trial.ExpectRefusal(mapping->GetSampleTemporalOffset(track, 0, &offset));
     }
+}
+
+void MappingRefusesNull(Trial& trial) {
+    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64,
+                            std::uintmax_t) {
+        trial.Doing("asking about track " + std::to_string(track) + " with null for the output");
+        trial.ExpectRefusal(mapping.GetNumberOfChannels(track, nullptr));
+        trial.ExpectRefusal(mapping.GetNumberOfSamples(track, nullptr));
+        trial.ExpectRefusal(mapping.GetSampleSize(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetSamplePosition(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetSampleTemporalOffset(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetSampleProperties(track, 0, nullptr, nullptr));
+        trial.ExpectRefusal(mapping.GetNumberOfContiguousSamples(track, 0, nullptr));
+        trial.ExpectRefusal(mapping.GetNumberOfContiguousBytes(track, 0, nullptr));
+    });
 }
 
 void RefusesOtherSamples(Trial& trial) {
@@ -122,6 +142,39 @@ void RefusesOtherSamples(Trial& trial) {
                      "a refusal, or a place in the movie's file",
                      std::to_string(position) + " of a file of " + std::to_string(fileSize));
     });
+}
+
+void MappingRefused(Trial& trial, Refused refused) {
+    Containers containers(trial);
+    const SampleMovie movie = WriteSoundMovie(trial.folder());
+    MappingOf(containers, movie.file);
+    RefuseEach(
+        containers.module(), refused,
+        [&](int number) {
+            trial.Doing(std::string("asking for a movie's sample mapping while the host refuses ") +
+                        WordOf(refused) + " " + std::to_string(number));
+        },
+        [&] {
+            const auto container = containers.TryToOpen(movie.file);
+            host::Ref<NMA::ISampleMapping> mapping;
+            const NCFRESULT result =
+                container ? container->GetSampleMapping(mapping.Out()) : NCF_E_FAIL;
+            trial.Expect((result >= 0) == static_cast<bool>(mapping),
+                         "a mapping with success, or null with a failure",
+                         trial.Text(result) + (mapping ? ", and a mapping" : ", and null"));
+        });
+    trial.Doing("asking for a movie's sample mapping after the host has refused something");
+    host::Ref<NMA::ISampleMapping> mapping;
+    trial.ExpectSuccess(containers.Open(movie.file)->GetSampleMapping(mapping.Out()),
+                        "success, as before the refusals");
+}
+
+void CreationsRefusedInMapping(Trial& trial) {
+    MappingRefused(trial, Refused::kCreations);
+}
+
+void QueriesRefusedInMapping(Trial& trial) {
+    MappingRefused(trial, Refused::kQueries);
 }
 
 void MappingOutlivesTheContainer(Trial& trial) {
@@ -140,6 +193,8 @@ void MappingOutlivesTheContainer(Trial& trial) {
 }  // namespace
 
 std::vector<Check> MappingChecks() {
+    static constexpr char kRefusal[] =
+        "a result is not looked at, or the output is set although a later step fails";
     return {
         {"mapping-tracks", "A movie with picture and sound has tracks in its sample mapping.",
          "the answer is a result instead of the number", HasTracks},
@@ -152,6 +207,16 @@ std::vector<Check> MappingChecks() {
         {"mapping-other-samples",
          "For a sample beyond the last, a mapping names no place outside of the file.",
          "the number is not compared", RefusesOtherSamples},
+        {"mapping-null-outputs", "A mapping refuses null for an output.",
+         "the output is used before it is looked at", MappingRefusesNull},
+        {"mapping-creations-refused",
+         "When the host refuses to make the n-th component that a sample mapping asks for, for "
+         "every n, it is made or refused, and the next one works.",
+         kRefusal, CreationsRefusedInMapping},
+        {"mapping-queries-refused",
+         "When the host refuses the n-th interface that a sample mapping asks for, for every n, "
+         "it is made or refused, and the next one works.",
+         kRefusal, QueriesRefusedInMapping},
         {"mapping-outlives",
          "A mapping goes on when its container is released, and counts as "
          "alive.",

@@ -40,7 +40,11 @@ host::Ref<INCFClassFactory> FactoryOfMedia(Module& module, const GUID& interface
     module.trial().Skip(std::string("the module has no ") + what);
 }
 
-Containers::Containers(Trial& trial) : module_(trial) {
+Containers::Containers(Trial& trial, const std::function<void(host::Host&)>& prepare)
+    : module_(trial) {
+    if (prepare) {
+        prepare(module_.host());
+    }
     module_.Start();
     module_.OfferComponents();
     trial.Doing("looking for a component that is a container");

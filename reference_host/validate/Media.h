@@ -36,7 +36,8 @@ host::Ref<Interface> Make(Module& module, INCFClassFactory* factory) {
 // A started module that has containers for *.mov.
 class Containers {
 public:
-    explicit Containers(Trial& trial);
+    // `prepare` gets the host before the module starts.
+    explicit Containers(Trial& trial, const std::function<void(host::Host&)>& prepare = {});
 
     Trial& trial() { return module_.trial(); }
     Module& module() { return module_; }

@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "reference_host/validate/KnownInterfaces.h"
+#include "reference_host/validate/Locks.h"
 #include "reference_host/validate/Steps.h"
 
 namespace validate {
@@ -254,9 +255,28 @@ void ManyAtOnce(Trial& trial) {
     });
 }
 
+void LocksAreGivenBack(Trial& trial) {
+    LockCalls calls;  // outlives the module's host
+    Module module(trial);
+    RegisterCountingLocks(module.host(), calls);
+    module.Start();
+    ForEachObject(module, [&](Made& made) {
+        InterfacesOf(made.object.get());
+        trial.Doing("counting the locks that making an object of " + made.name + " took");
+        ExpectGivenBack(trial, calls);
+        trial.Doing("counting the locks that releasing an object of " + made.name + " took");
+        made.object.Reset();
+        ExpectGivenBack(trial, calls);
+    });
+    trial.Doing("counting the locks that were taken when NCFShutdown is done");
+    module.Shutdown();
+    ExpectGivenBack(trial, calls);
+}
+
 }  // namespace
 
 std::vector<Check> ObjectChecks() {
+    static constexpr char kLocks[] = "a way out of a function passes over the Unlock";
     return {
         {"create-by-class-id", "Every class that has a class factory can be made by it.",
          "the constructor or the second step of construction needs more than the host",
@@ -291,6 +311,8 @@ std::vector<Check> ObjectChecks() {
          "the count is no atomic number", CountsOnThreads},
         {"objects-many", "A thousand objects of a class may live at once, and end in any order.",
          "objects are kept in a table of a fixed size, or share a buffer", ManyAtOnce},
+        {"objects-locks", "An object gives each lock of the host's back that it takes.", kLocks,
+         LocksAreGivenBack},
     };
 }
 

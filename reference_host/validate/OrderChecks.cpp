@@ -184,6 +184,65 @@ void RegisteredOnTwoThreads(Trial& trial) {
     });
 }
 
+void PluginRegisteredOnTwoThreads(Trial& trial) {
+    Module module(trial);
+    const host::PluginFacts facts = module.Plugin();
+    trial.Doing("calling NCFRegisterPlugin on two threads at once, 200 times");
+    OnThreads(2, [&](unsigned) {
+        for (int round = 0; round < 200; ++round) {
+            host::Ref<INCFPluginDefinition> handed;
+            trial.ExpectSuccess(module.registerPlugin(module.unknown(), handed.Out()));
+            const host::PluginFacts again = FactsOf(trial, handed.get());
+            trial.Expect(again.id == facts.id && again.componentCount == facts.componentCount,
+                         "the same answer on each thread",
+                         "another id or another number of components");
+        }
+    });
+}
+
+void AskedToUnloadOnTwoThreads(Trial& trial) {
+    constexpr int kQuestions = 1000;
+    Module module(trial);
+    module.Start();
+    trial.Doing("calling NCFCanUnloadNow on two threads at once while nothing is alive");
+    OnThreads(2, [&](unsigned) {
+        for (int question = 0; question < kQuestions; ++question) {
+            ExpectIdle(module, "on each thread while nothing is alive");
+        }
+    });
+    ForEachObject(module, [&](Made& made) {
+        trial.Doing("calling NCFCanUnloadNow on two threads at once while an object of " +
+                    made.name + " lives");
+        OnThreads(2, [&](unsigned) {
+            for (int question = 0; question < kQuestions; ++question) {
+                trial.ExpectRefusal(module.canUnloadNow(module.unknown()),
+                                    "a refusal on each thread");
+            }
+        });
+    });
+}
+
+void CreatedBeforeStart(Trial& trial) {
+    Module module(trial);
+    const auto components = module.Components();
+    for (std::size_t i = 0; i < components.size(); ++i) {
+        trial.Doing("making an object of " + NameOf(components[i], i) + " before NCFStartup");
+        const auto factory = FactoryOf(module, components[i]);
+        if (!factory) {
+            continue;
+        }
+        void* out = nullptr;
+        const NCFRESULT result =
+            factory->CreateInstance(module.unknown(), nullptr, IID_INCFUnknown, &out);
+        const auto object = host::Ref<INCFUnknown>::Adopt(static_cast<INCFUnknown*>(out));
+        trial.Expect((result >= 0) == static_cast<bool>(object),
+                     "an object with success, or null with a failure",
+                     trial.Text(result) + (object ? ", and an object" : ", and null"));
+    }
+    trial.Doing("calling NCFCanUnloadNow before NCFStartup, when the objects are released");
+    ExpectIdle(module, "when all objects are released");
+}
+
 void CreatedOnThreads(Trial& trial) {
     Module module(trial);
     module.Start();
@@ -253,6 +312,9 @@ std::vector<Check> OrderChecks() {
          "NCFGetClassFactory before NCFStartup and after NCFShutdown gives a class factory or "
          "refuses.",
          "it uses something that NCFStartup makes", AskedForFactoriesWhileNotStarted},
+        {"order-creation-not-started",
+         "An object that is made before NCFStartup is whole, or is refused.",
+         "a constructor uses something that NCFStartup makes", CreatedBeforeStart},
         {"order-start-twice", "NCFStartup may come twice and needs one NCFShutdown.",
          "starts are counted, or a second one is refused", StartedTwice},
         {"order-shutdown-twice", "NCFShutdown may come twice.",
@@ -269,6 +331,14 @@ std::vector<Check> OrderChecks() {
         {"order-registration-on-two-threads",
          "Registration may run on two threads at once, with the same answers.",
          "a definition is kept in a global variable while it is filled in", RegisteredOnTwoThreads},
+        {"order-plugin-registration-on-two-threads",
+         "NCFRegisterPlugin may run on two threads at once, with the same answers.",
+         "the definition is kept in a global variable while it is filled in",
+         PluginRegisteredOnTwoThreads},
+        {"order-unload-question-on-two-threads",
+         "NCFCanUnloadNow may be asked on two threads at once, with the same answer.",
+         "the question changes something, or belongs to the thread that started the module",
+         AskedToUnloadOnTwoThreads},
         {"order-creation-on-threads",
          "Objects may be made and released on several threads at once.",
          "the counter of objects is not atomic, or creation shares a variable", CreatedOnThreads},

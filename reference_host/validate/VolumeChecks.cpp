@@ -42,6 +42,49 @@ void LeavesOtherFolders(Trial& trial) {
     trial.Expect(!volumes.Claims(volumes.movies()[0].file), "0", "1");
 }
 
+void VolumeRefusesNullPaths(Trial& trial, NMA::IMediaVolume& volume) {
+    trial.Doing("calling IsMediaVolume with null for the path");
+    trial.ExpectResult(0, volume.IsMediaVolume(nullptr), "0, whatever happens");
+    trial.Doing("calling GetVolumeInfo with null for the path");
+    host::Ref<NMA::IVolumeInfo> info;
+    trial.ExpectRefusal(volume.GetVolumeInfo(nullptr, info.Out()));
+    trial.Doing("calling GetMediaFormat with null for the path");
+    host::Ref<NMA::IMediaFormat> format;
+    trial.ExpectRefusal(volume.GetMediaFormat(nullptr, format.Out()));
+}
+
+void VolumeRefusesNullOutputs(Trial& trial, Volumes& volumes) {
+    const auto path = host::ModulePath(volumes.folder());
+    NMA::IMediaVolume& volume = *volumes.volume();
+    trial.Doing("calling GetVolumeInfo with null for the output");
+    trial.ExpectRefusal(volume.GetVolumeInfo(path.get(), nullptr));
+    trial.Doing("calling GetMediaFormat with null for the output");
+    trial.ExpectRefusal(volume.GetMediaFormat(path.get(), nullptr));
+    trial.Doing("calling GetContainerComponentId with null for the output");
+    trial.ExpectRefusal(volume.GetContainerComponentId(nullptr));
+    host::Ref<NMA::IVolumeInfo> info;
+    trial.ExpectSuccess(volume.GetVolumeInfo(path.get(), info.Out()));
+    trial.Doing("asking a volume for type, serial number, label and date with null for the output");
+    trial.ExpectRefusal(info->GetType(nullptr));
+    trial.ExpectRefusal(info->GetSerialNumber(nullptr));
+    trial.ExpectRefusal(info->GetLabel(nullptr));
+    trial.ExpectRefusal(info->GetModificationDate(nullptr));
+    host::Ref<NMA::IMediaFormat> format;
+    trial.ExpectSuccess(volume.GetMediaFormat(path.get(), format.Out()));
+    trial.Doing("asking a folder's format for its clips with null for the output");
+    trial.ExpectRefusal(format->GetAAFClips(nullptr));
+    const auto clips = volumes.ClipsOf(volumes.folder());
+    trial.Doing("asking a folder's list for path and description with null for the output");
+    trial.ExpectRefusal(clips->GetClipPath(0, nullptr));
+    trial.ExpectRefusal(clips->GetMetadata(0, nullptr));
+}
+
+void VolumeRefusesNull(Trial& trial) {
+    Volumes volumes(trial);
+    VolumeRefusesNullPaths(trial, *volumes.volume());
+    VolumeRefusesNullOutputs(trial, volumes);
+}
+
 void TellsOfAFolder(Trial& trial) {
     Volumes volumes(trial);
     trial.Doing("calling GetVolumeInfo with a folder of movies");
@@ -168,6 +211,48 @@ void GoesOnWithBadFiles(Trial& trial) {
     }
 }
 
+// Lists a folder as far as the host lets the module.
+void ListAnyway(Trial& trial, Volumes& volumes) {
+    const auto path = host::ModulePath(volumes.folder());
+    volumes.Claims(volumes.folder());
+    host::Ref<NMA::IVolumeInfo> info;
+    const bool hasInfo = volumes.volume()->GetVolumeInfo(path.get(), info.Out()) >= 0;
+    trial.Expect(!hasInfo || info, "an info with success", "null");
+    host::Ref<INCFString> label;
+    const bool hasLabel = hasInfo && info->GetLabel(label.Out()) >= 0;
+    trial.Expect(!hasLabel || label, "a label with success", "null");
+    host::Ref<NMA::IMediaFormat> format;
+    const bool hasFormat = volumes.volume()->GetMediaFormat(path.get(), format.Out()) >= 0;
+    trial.Expect(!hasFormat || format, "a format with success", "null");
+    host::Ref<NMA::IAAFClips> clips;
+    const bool hasClips = hasFormat && format->GetAAFClips(clips.Out()) >= 0;
+    trial.Expect(!hasClips || clips, "a list with success", "null");
+}
+
+void ListingRefused(Trial& trial, Refused refused) {
+    Volumes volumes(trial);
+    const ncfSInt32 before = volumes.ClipsOf(volumes.folder())->GetCount();
+    RefuseEach(
+        volumes.module(), refused,
+        [&](int number) {
+            trial.Doing(std::string("listing a folder while the host refuses ") + WordOf(refused) +
+                        " " + std::to_string(number));
+        },
+        [&] { ListAnyway(trial, volumes); });
+    trial.Doing("listing a folder after the host has refused something");
+    trial.Expect(volumes.Claims(volumes.folder()), "1, as before the refusals", "0");
+    const ncfSInt32 after = volumes.ClipsOf(volumes.folder())->GetCount();
+    trial.Expect(after == before, "as many clips as before the refusals", std::to_string(after));
+}
+
+void CreationsRefusedInListing(Trial& trial) {
+    ListingRefused(trial, Refused::kCreations);
+}
+
+void QueriesRefusedInListing(Trial& trial) {
+    ListingRefused(trial, Refused::kQueries);
+}
+
 void ListOutlivesVolume(Trial& trial) {
     Volumes volumes(trial);
     const auto clips = volumes.ClipsOf(volumes.folder());
@@ -191,6 +276,9 @@ std::vector<Check> VolumeChecks() {
          "A volume answers 0 for an empty folder, for one that is not there and for a file.",
          "a failure is handed on instead of 0, or the folder is not looked into",
          LeavesOtherFolders},
+        {"volume-null-arguments",
+         "A volume and what it hands out refuse null for a path and for an output.",
+         "the argument is used before it is looked at", VolumeRefusesNull},
         {"volume-info",
          "A claimed folder has a volume info with type, serial number, label and date.",
          "an output is left as it was", TellsOfAFolder},
@@ -212,6 +300,14 @@ std::vector<Check> VolumeChecks() {
          "A folder with broken and hostile files is listed, and each of them refused or "
          "described.",
          "what stands in a file is used before it is looked at", GoesOnWithBadFiles},
+        {"volume-creations-refused",
+         "When the host refuses to make the n-th component that listing a folder asks for, for "
+         "every n, the folder is listed or refused, and the next one works.",
+         kPair, CreationsRefusedInListing},
+        {"volume-queries-refused",
+         "When the host refuses the n-th interface that listing a folder asks for, for every n, "
+         "the folder is listed or refused, and the next one works.",
+         kPair, QueriesRefusedInListing},
         {"volume-released-first", "A folder's list goes on when its volume is released.",
          "the list points into the volume or the format", ListOutlivesVolume},
     };

@@ -35,7 +35,13 @@ class Tally : public testing::EmptyTestEventListener {
     }
 };
 
-pid_t program = 0;
+#ifdef _WIN32
+void setenv(const char* name, const char* value, int) {
+    _putenv_s(name, value);
+}
+#endif
+
+int program = 0;
 bool isOver = false;
 
 void FailWhenATestExits() {

@@ -141,6 +141,44 @@ TEST_F(CompareVerb, AnswersInJson) {
     EXPECT_EQ(same["differences"], Json::array());
 }
 
+// What can't be written to its end tells nobody that the files are alike, or that this is all.
+TEST_F(CompareVerb, FailsWhereItsAnswerCanNotBeWritten) {
+    Describe(Movie("1/a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("2/a.mov", 11, 3), "--aaf " + In("b.aaf"));
+    const std::string program = Quoted(ProgramFolder() / "cliphost") + " compare ";
+    for (const std::string form : {"", "--json "}) {
+        for (const std::string& files :
+             {In("a.aaf") + " " + In("a.aaf"), In("a.aaf") + " " + In("b.aaf")}) {
+            const CommandResult full = RunCommand(program + form + files + " 2>&1 >/dev/full");
+            EXPECT_EQ(full.status, 2);
+            EXPECT_EQ(full.out.find("cliphost: standard output: not written: No space left"), 0u)
+                << full.out;
+        }
+        // In the middle.
+        const CommandResult cut =
+            RunCommand("ulimit -f 1; exec " + program + form + In("a.aaf") + " " + In("b.aaf") +
+                       " 2>" + In("told") + " >" + In("answer"));
+        EXPECT_EQ(cut.status, 2);
+        const movies::Bytes answer = ReadFile(folder() / "answer");
+        EXPECT_FALSE(answer.empty());
+        EXPECT_FALSE(Json::accept(answer));
+        const movies::Bytes told = ReadFile(folder() / "told");
+        EXPECT_NE(std::string(told.begin(), told.end()).find("standard output: not written: "),
+                  std::string::npos);
+    }
+}
+
+// Who has seen a difference may stop reading.
+TEST_F(CompareVerb, TellsADifferenceByItsStatusToAReaderThatGoes) {
+    Describe(Movie("1/a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("2/a.mov", 11, 9), "--aaf " + In("b.aaf"));
+    const CommandResult ran =
+        RunCommand("bash -c " +
+                   Quoted("exec 3> >(true); wait $!; " + Quoted(ProgramFolder() / "cliphost") +
+                          " compare --json " + In("a.aaf") + " " + In("b.aaf") + " >&3; echo $?"));
+    EXPECT_EQ(ran.out, "1\n");
+}
+
 // Of long values the first bytes are shown; the last ones count as well.
 TEST_F(CompareVerb, SeesADifferenceBehindWhatItShowsOfAValue) {
     Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
@@ -283,6 +321,87 @@ TEST_F(DescribeAgainst, ComparesNothingWhereNoMovieIsDescribed) {
     std::ofstream(folder() / "b.mov") << "no movie at all";
     ExpectSays(RunCliphost("describe " + In("b.mov") + " --against " + In("a.aaf")), 1,
                "a.aaf: not compared: no movie was described");
+}
+
+TEST_F(DescribeAgainst, FailsWhereItsAnswerCanNotBeWritten) {
+    const std::string movie = Movie("in/a.mov", 10);
+    Describe(movie, "--aaf " + In("a.aaf"));
+    Movie("in/a.mov", 11, 3);
+    for (const std::string form : {"", "--json", "--jsonl"}) {
+        const CommandResult cut = RunCommand(
+            "ulimit -f 1; exec " + Quoted(ProgramFolder() / "cliphost") + " describe " + movie +
+            " " + form + " --against " + In("a.aaf") + " 2>" + In("told") + " >" + In("answer"));
+        EXPECT_EQ(cut.status, 2) << form;
+        const movies::Bytes answer = ReadFile(folder() / "answer");
+        EXPECT_FALSE(Json::accept(answer));
+        const movies::Bytes told = ReadFile(folder() / "told");
+        EXPECT_NE(std::string(told.begin(), told.end()).find("standard output: not written: "),
+                  std::string::npos);
+    }
+}
+
+// Nothing is known of what became of it.
+TEST_F(DescribeAgainst, TellsAMovieThatCanNotBeDescribedAsThatAndNotAsGone) {
+    Movie("in/a.mov", 10);
+    Movie("in/b.mov", 11);
+    Describe(In("in"), "--bin " + In("old.aaf"));
+    std::ofstream(folder() / "in/b.mov") << "no movie at all";
+    for (const char* const jobs : {"1", "2"}) {
+        const CommandResult compared = RunCliphost("describe " + In("in") + " --against " +
+                                                   In("old.aaf") + " --jobs " + std::string(jobs));
+        ExpectSays(compared, 1, "master mob \"b\" not described: ");
+        ExpectSays(compared, 1, "source mob \"b\" (MultipleDescriptor) not described: ");
+        ExpectSays(compared, 1, "no differences: 3 objects alike, 3 objects not described\n");
+        EXPECT_EQ(compared.out.find(" gone"), std::string::npos) << compared.out;
+    }
+    const CommandResult json =
+        Answer("describe " + In("in") + " --json --against " + In("old.aaf"));
+    EXPECT_EQ(json.status, 1);
+    const Json last = Json::parse(json.out).back();
+    EXPECT_EQ(last["counts"]["differences"], 0);
+    EXPECT_EQ(last["counts"]["gone"], 0);
+    EXPECT_EQ(last["counts"]["notDescribed"], 3);
+    ASSERT_EQ(last["differences"].size(), 3u);
+    EXPECT_EQ(last["differences"][0]["kind"], "notDescribed");
+    EXPECT_EQ(last["differences"][0]["before"], "MasterMob");
+    EXPECT_EQ(last["differences"][0]["after"], nullptr);
+}
+
+// It would pass for the only clip of another name.
+TEST_F(DescribeAgainst, TakesNoOtherMovieForOneThatCanNotBeDescribed) {
+    Describe(Movie("in/a.mov", 10), "--aaf " + In("a.aaf"));
+    std::ofstream(folder() / "in/a.mov") << "no movie at all";
+    const CommandResult compared = RunCliphost("describe " + In("in/a.mov") + " " +
+                                               Movie("in/b.mov", 11) + " --against " + In("a.aaf"));
+    ExpectSays(compared, 1, "master mob \"a\" not described: ");
+    ExpectSays(compared, 1, "master mob \"b\" new\n");
+    ExpectSays(compared, 1, "3 differences: 3 objects new, 3 objects not described\n");
+}
+
+TEST_F(DescribeAgainst, KnowsTheMoviesOfAFolderThatFailsAndOfAnotherMachinesPlaces) {
+    Movie("in/a.mov", 10);
+    Movie("in/sub/b.mov", 11);
+    const std::string map = " --map " + Quoted((folder() / "in").string() + "=//server/media");
+    const std::string call = In("in") + " " + In("in/sub") + map;
+    Describe(call, "--bin " + In("old.aaf"));
+    fs::remove_all(folder() / "in/sub");
+    const CommandResult compared = RunCliphost("describe " + call + " --against " + In("old.aaf"));
+    ExpectSays(compared, 2, "master mob \"b\" not described: there is no such file or folder\n");
+    ExpectSays(compared, 2, "no differences: 3 objects alike, 3 objects not described\n");
+}
+
+TEST_F(DescribeAgainst, TellsAMovieThatWentAsGoneBesideOneThatFails) {
+    Movie("in/a.mov", 10);
+    Movie("in/b.mov", 11);
+    Movie("in/c.mov", 12);
+    Describe(In("in"), "--bin " + In("old.aaf"));
+    std::ofstream(folder() / "in/b.mov") << "no movie at all";
+    fs::remove(folder() / "in/c.mov");
+    const CommandResult compared =
+        RunCliphost("describe " + In("in") + " --against " + In("old.aaf"));
+    ExpectSays(compared, 1, "master mob \"c\" gone\n");
+    ExpectSays(compared, 1,
+               "3 differences: 3 objects alike, 3 objects gone, 3 objects not described\n");
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 
 #include <cmath>
 #include <fstream>
+#include <functional>
 #include <nlohmann/json.hpp>
 #include <set>
 #include <sstream>
@@ -48,6 +49,12 @@ protected:
     Json ClipOf(const std::filesystem::path& movie, const std::string& options = "") {
         const Json report = Report(Quoted(movie) + " " + options);
         return report["clips"].size() == 1 ? report["clips"][0] : Json::object();
+    }
+    void MakeCatalog(const std::string& of, const std::string& options = "") {
+        const CommandResult made =
+            RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
+                       " catalog " + of + " -o c.sqlite " + options + " 2>&1");
+        ASSERT_TRUE(std::filesystem::exists(folder() / "c.sqlite")) << made.out;
     }
     std::set<std::string> FilesIn(const std::string& name) {
         std::set<std::string> files;
@@ -179,6 +186,38 @@ TEST_F(Reports, TellSilence) {
     EXPECT_EQ(TraitsOf(ClipOf(MadeMovie("h264_with_aac.mov"))).count("silent"), 0u);
 }
 
+// Sound of half an hour and a bit, which is silent but for a moment. Its bytes are holes, mostly.
+movies::Movie LongSound(std::uint64_t loudSample) {
+    constexpr std::uint64_t kSamples = 96'000'000;  // 240 columns of 400,000
+    movies::SoundFormat format;
+    format.channels = 1;
+    movies::Movie movie;
+    movie.tracks = {movies::SoundTrack(format, kSamples)};
+    movie.largeMedia = true;
+    movies::Track& track = movie.tracks[0];
+    track.data.assign(static_cast<std::size_t>(loudSample + 1) * 2, 0);
+    track.data.back() = 0x40;
+    return movie;
+}
+
+TEST_F(Reports, LookAtLongSoundInPieces) {
+    const Json wave = ClipOf(Write(LongSound(16'383), "piece.mov"))["details"]["waves"][0];
+    EXPECT_EQ(wave["isWhole"], false);
+    EXPECT_EQ(wave["lacksSamples"], false);
+    EXPECT_NEAR(wave["seconds"].get<double>(), 2000, 1);
+    ASSERT_EQ(wave["peaks"].size(), 240u);
+    EXPECT_EQ(wave["peaks"][0], std::lround(255 * std::sqrt(0.5)));
+    EXPECT_EQ(wave["peaks"][1], 0);
+}
+
+TEST_F(Reports, CallNoSoundSilentThatWasLookedAtInPieces) {
+    const Json clip = ClipOf(Write(LongSound(16'384), "between.mov"));
+    const Json& wave = clip["details"]["waves"][0];
+    EXPECT_EQ(wave["isWhole"], false);
+    EXPECT_FALSE(wave.contains("highest"));
+    EXPECT_EQ(TraitsOf(clip).count("silent"), 0u);
+}
+
 TEST_F(Reports, CallNoSoundSilenceThatWasNotLookedAt) {
     const std::string silence = "-f lavfi -t 0.2 -i anullsrc=r=48000:cl=mono ";
     const std::string sine = "-f lavfi -i sine=sample_rate=48000:duration=0.2 ";
@@ -232,6 +271,145 @@ TEST_F(Reports, TellWhatIsOddTogether) {
     }
 }
 
+// A movie that is odd in nothing: two seconds of pictures, sound and timecode.
+movies::Movie PlainMovie(std::uint32_t timeScale = 25, std::uint32_t frameDuration = 1,
+                         unsigned flags = movies::kTimecode24Hours) {
+    const std::uint32_t frames = 2 * timeScale / frameDuration;
+    movies::VideoFormat picture;
+    picture.codec = "apcn";
+    picture.fields = {1u, 0u};
+    picture.nclc = {1u, 1u, 1u};
+    movies::TimecodeFormat timecode;
+    timecode.timeScale = timeScale;
+    timecode.frameDuration = frameDuration;
+    timecode.numFrames = (timeScale + frameDuration - 1) / frameDuration;
+    timecode.flags = flags;
+    movies::Movie movie;
+    movie.tracks = {movies::VideoTrack(picture, frames, timeScale, frameDuration, 64),
+                    movies::SoundTrack(movies::SoundFormat(), 96000),
+                    movies::TimecodeTrack(timecode, 90000, frames)};
+    movie.tracks[1].fill = 1;  // so that it is heard
+    return movie;
+}
+
+movies::Movie With(const std::function<void(movies::VideoFormat& format)>& change) {
+    movies::Movie movie = PlainMovie();
+    movies::VideoFormat format;
+    format.codec = "apcn";
+    format.fields = {1u, 0u};
+    format.nclc = {1u, 1u, 1u};
+    change(format);
+    movie.tracks[0].descriptions = {format.ToBox()};
+    return movie;
+}
+
+movies::Movie With(const std::function<void(movies::Movie& movie)>& change) {
+    movies::Movie movie = PlainMovie();
+    change(movie);
+    return movie;
+}
+
+movies::Movie WithEdits(std::vector<movies::Edit> edits) {
+    return With([&](movies::Movie& movie) { movie.tracks[0].edits = std::move(edits); });
+}
+
+struct OddMovie {
+    const char* trait;  // what is odd about it; empty: nothing
+    const char* words;
+    movies::Movie movie;
+};
+
+std::vector<OddMovie> OddMovies() {
+    const auto first = [](movies::Movie& movie) -> movies::Track& { return movie.tracks[0]; };
+    return {
+        {"", "", PlainMovie()},
+        {"variableRate", "pictures last from 40 to 120 ms", With([&](movies::Movie& movie) {
+             first(movie).samples = {{20, 64, 1}, {10, 64, 3}};
+         })},
+        // Such as a rate that the time scale does not divide.
+        {"", "", With([&](movies::Movie& movie) {
+             first(movie).mediaTimeScale = 2500;
+             first(movie).samples = {{20, 64, 100}, {30, 64, 101}};
+         })},
+        {"pixelAspect", "pixels are 16:15", With([](movies::VideoFormat& format) {
+             format.pixelAspect = {16, 15};
+         })},
+        {"", "", With([](movies::VideoFormat& format) {
+             format.pixelAspect = {1, 1};
+         })},
+        {"provider", "video: The FOURCC video code of xyz1 is not natively supported.",
+         With([](movies::VideoFormat& format) { format.codec = "xyz1"; })},
+        {"rotated", "rotated by 90 degrees",
+         With([&](movies::Movie& movie) { first(movie).matrix = movies::kRotated90; })},
+        {"rotated", "rotated by 180 degrees",
+         With([&](movies::Movie& movie) { first(movie).matrix = movies::kRotated180; })},
+        {"rotated", "rotated by 270 degrees",
+         With([&](movies::Movie& movie) { first(movie).matrix = movies::kRotated270; })},
+        {"noTimecode", "no timecode track",
+         With([](movies::Movie& movie) { movie.tracks.pop_back(); })},
+        {"noSound", "no sound track",
+         With([](movies::Movie& movie) { movie.tracks.erase(movie.tracks.begin() + 1); })},
+        {"silent", "all of its sound is silence",
+         With([](movies::Movie& movie) { movie.tracks[1].fill = 0; })},
+        {"edits", "picture: the first 0.2 s of the media are left out",
+         WithEdits({{1080, 5, 1.0}})},
+        {"edits", "picture: begins with a pause", WithEdits({{120, -1, 1.0}, {1200, 0, 1.0}})},
+        {"edits", "picture: several edits, or another speed",
+         WithEdits({{600, 0, 1.0}, {300, 30, 1.0}})},
+        {"edits", "picture: several edits, or another speed", WithEdits({{600, 0, 2.0}})},
+        {"", "", WithEdits({{1200, 0, 1.0}})},
+    };
+}
+
+TEST_F(Reports, TellWhatIsOddAboutAMovieAndNothingElse) {
+    std::filesystem::create_directory(folder() / "in");
+    const std::vector<OddMovie> movies = OddMovies();
+    for (std::size_t i = 0; i < movies.size(); ++i) {
+        Write(movies[i].movie, "in/" + std::to_string(100 + i) + ".mov");
+    }
+    const Json clips = Report("in")["clips"];
+    ASSERT_EQ(clips.size(), movies.size());
+    for (std::size_t i = 0; i < movies.size(); ++i) {
+        SCOPED_TRACE(std::to_string(i) + " " + movies[i].words);
+        std::set<std::string> wanted;
+        if (*movies[i].trait != '\0') {
+            wanted.insert(movies[i].trait);
+        }
+        EXPECT_EQ(TraitsOf(clips[i]), wanted);
+        EXPECT_EQ(WordsOf(clips[i], movies[i].trait), movies[i].words);
+    }
+}
+
+// "colors: Rec. 2020, HLG (9-18-9) 1, Rec. 709 (1-1-1) 0" of a finding.
+std::string Groups(const Json& report, const std::string& finding) {
+    std::string text;
+    for (const Json& one : report["odd"]) {
+        for (const Json& group : one["id"] == finding ? one["groups"] : Json::array()) {
+            text += (text.empty() ? "" : ", ") + group["label"].get<std::string>();
+            for (const Json& clip : group["clips"]) {
+                text += " " + std::to_string(clip.get<int>());
+            }
+        }
+    }
+    return text;
+}
+
+TEST_F(Reports, TellWhatMoviesMix) {
+    std::filesystem::create_directory(folder() / "in");
+    Write(PlainMovie(), "in/0.mov");
+    Write(PlainMovie(), "in/1.mov");
+    Write(With([](movies::VideoFormat& format) { format.nclc = {9u, 18u, 9u}; }), "in/2.mov");
+    Write(With([](movies::VideoFormat& format) { format.nclc.reset(); }), "in/3.mov");
+    Write(PlainMovie(30000, 1001), "in/4.mov");
+    Write(PlainMovie(30000, 1001, movies::kTimecode24Hours | movies::kTimecodeDrop), "in/5.mov");
+    const Json report = Report("in");
+    EXPECT_EQ(Groups(report, "colors"),
+              "Rec. 2020, HLG (9-18-9) 2, Rec. 709 (1-1-1) 0 1 4 5, not told 3");
+    EXPECT_EQ(Groups(report, "drop"), "drop-frame 5, non-drop 4");
+    EXPECT_EQ(Groups(report, "rates"), "25/1 0 1 2 3, 30000/1001 4 5");
+    EXPECT_EQ(Groups(report, "copies"), report["clips"][0]["id"].get<std::string>() + " 0 1");
+}
+
 TEST_F(Reports, CallNoMovieACopyOfItself) {
     Copy("pcm_u8.mov", "in/a.mov");
     const Json report = Report("in in/a.mov");
@@ -258,10 +436,7 @@ TEST_F(Reports, HoldMoviesThatCanNotBeDescribedWithTheReason) {
 TEST_F(Reports, ShowWhatACatalogKnowsOfMoviesThatAreGone) {
     Copy("h264_with_aac.mov", "in/a.mov");
     Copy("pcm_u8.mov", "in/b.mov");
-    ASSERT_EQ(RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
-                         " catalog in -o c.sqlite --thumbnails")
-                  .status,
-              0);
+    MakeCatalog("in", "--thumbnails");
     std::filesystem::remove(folder() / "in/a.mov");
     const Json report = Report("c.sqlite");
     EXPECT_EQ(status, 2);
@@ -281,6 +456,32 @@ TEST_F(Reports, RefuseADatabaseThatIsNoCatalog) {
         << std::string("SQLite format 3\0", 16) << std::string(84, '\0');
     ExpectSays(Run("x.sqlite -o r.html"), 2, "x.sqlite: ");
     EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+}
+
+TEST_F(Reports, TellThatACatalogHoldsNoMovie) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    std::filesystem::create_directory(folder() / "empty");
+    MakeCatalog("empty");
+    const CommandResult alone = Run("c.sqlite -o r.html");
+    ExpectSays(alone, 1, "c.sqlite: the catalog holds no movie; `cliphost catalog");
+    ExpectSays(alone, 1, "r.html: not written: there is no movie to show");
+    EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
+    const CommandResult beside = Run("c.sqlite in/a.mov -o r.html");
+    ExpectSays(beside, 1, "c.sqlite: the catalog holds no movie");
+    ExpectSays(beside, 1, "r.html: 1 clip,");
+}
+
+TEST_F(Reports, TakeNoCatalogOutOfAList) {
+    Copy("pcm_u8.mov", "in/a.mov");
+    MakeCatalog("in");
+    std::ofstream(folder() / "l.txt") << "in/a.mov\nc.sqlite\n";
+    const Json report = Report("--files-from l.txt");
+    EXPECT_EQ(status, 2);
+    ASSERT_EQ(report["clips"].size(), 2u);
+    EXPECT_EQ(report["clips"][0]["failed"], false);
+    EXPECT_EQ(report["clips"][1]["failed"], true);
+    EXPECT_EQ(report["clips"][1]["warnings"][0].value("hint", ""),
+              "name a catalog on the command line, not in a list");
 }
 
 TEST_F(Reports, TellPlacesAsAnotherMachineSeesThem) {
@@ -324,9 +525,38 @@ TEST_F(Reports, PutPicturesIntoAFolderBesideThePage) {
     const std::string page = TextOfFile(folder() / "my report.html");
     EXPECT_EQ(page.find("\"data\":\""), std::string::npos);
     EXPECT_NE(page.find("my%20report_files/00000-poster.webp"), std::string::npos);
-    // What an earlier page had more goes.
-    ExpectSays(Run("in/a.mov -o 'my report.html' --split"), 0, "1 clip");
-    EXPECT_EQ(FilesIn("my report_files").size(), 2u);
+}
+
+// As a page of 1,000 clips has to stay below 60 MB.
+TEST_F(Reports, TakeNoMoreThanSixtyThousandBytesForAClip) {
+    std::filesystem::create_directory(folder() / "in");
+    Make(
+        "-f lavfi -i 'nullsrc=size=640x360:rate=25:duration=1,geq=random(1)*255:random(2)*255:"
+        "random(3)*255' -f lavfi -i anoisesrc=duration=1:sample_rate=48000 -c:v mjpeg -q:v 2 "
+        "-c:a pcm_s16le",
+        "in/a.mov");
+    ExpectSays(Run("in -o one.html"), 0, "1 clip");
+    std::filesystem::copy_file(folder() / "in/a.mov", folder() / "in/b.mov");
+    ExpectSays(Run("in -o two.html"), 0, "2 clips");
+    const auto size = [&](const char* page) { return std::filesystem::file_size(folder() / page); };
+    EXPECT_GT(size("two.html") - size("one.html"), 20'000u);
+    EXPECT_LE(size("two.html") - size("one.html"), 60'000u);
+}
+
+TEST_F(Reports, RemoveThePicturesOfAnEarlierPageAndNoOtherFile) {
+    Copy("h264_with_aac.mov", "in/a.mov");
+    Copy("pcm_u8.mov", "in/b.mov");  // has none
+    Copy("rotated_270.mov", "in/c.mov");
+    ExpectSays(Run("in -o r.html --split"), 0, "3 clips");
+    const std::set<std::string> both = {"00000-poster.webp", "00000-strip.webp",
+                                        "00002-poster.webp", "00002-strip.webp"};
+    EXPECT_EQ(FilesIn("r_files"), both);
+    const std::set<std::string> others = {"00009-poster.txt", "notes.webp", "9-strip.webp"};
+    for (const std::string& other : others) {
+        std::ofstream(folder() / "r_files" / other) << "mine";
+    }
+    ExpectSays(Run("in/b.mov -o r.html --split"), 0, "1 clip");
+    EXPECT_EQ(FilesIn("r_files"), others);
 }
 
 TEST_F(Reports, GoToStandardOutputWhole) {
@@ -358,6 +588,21 @@ TEST_F(Reports, RefuseCallsThatCanNotBeMeant) {
     EXPECT_FALSE(std::filesystem::exists(folder() / "r.html"));
 }
 
+// The page's beginning is shorter than that, and the first clip is not.
+TEST_F(Reports, EndWithTheFirstClipThatCanNotBeWritten) {
+    Copy("h264_with_aac.mov", "in/a.mov");
+    Copy("h264_with_aac.mov", "in/b.mov");
+    for (const char* const options : {"", " --split", " --jobs 2", " --split --jobs 2"}) {
+        SCOPED_TRACE(options);
+        const CommandResult ran = RunCommand("ulimit -f 40; cd " + Quoted(folder()) + " && " +
+                                             Quoted(ProgramFolder() / "cliphost") +
+                                             " report in -o r.html" + options + " 2>&1");
+        ExpectSays(ran, 2, "not written: File too large");
+        EXPECT_EQ(ran.out.find("not written"), ran.out.rfind("not written")) << ran.out;
+        EXPECT_EQ(FilesIn("."), std::set<std::string>{"in"});
+    }
+}
+
 TEST_F(Reports, TakeThePlaceOfNoMovieThatIsRead) {
     Copy("pcm_u8.mov", "in/a.mov");
     Copy("pcm_u8.mov", "in/b.mov");
@@ -373,10 +618,7 @@ TEST_F(Reports, TakeThePlaceOfNoMovieThatIsRead) {
 TEST_F(Reports, TakeThePlaceOfNoListOrCatalogThatIsRead) {
     Copy("pcm_u8.mov", "in/a.mov");
     std::ofstream(folder() / "l.txt") << "in/a.mov\n";
-    ASSERT_EQ(RunCommand("cd " + Quoted(folder()) + " && " + Quoted(ProgramFolder() / "cliphost") +
-                         " catalog in -o c.sqlite")
-                  .status,
-              0);
+    MakeCatalog("in");
     const std::string catalog = TextOfFile(folder() / "c.sqlite");
     ExpectSays(Run("c.sqlite -o c.sqlite"), 2,
                "c.sqlite: this is a catalog that the page is made from");

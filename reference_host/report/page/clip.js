@@ -53,7 +53,7 @@ function summary(clip, details) {
     ['Size', clip.size === undefined ? undefined : clip.size + ' bytes'],
     ['Changed', clip.date],
     ['Id', clip.id],
-    ['Read', ROUTES[clip.route] + (details.routeReason ? ', since ' + details.routeReason : '')],
+    ['Read', ROUTES[clip.route] && ROUTES[clip.route] + (details.routeReason ? ', since ' + details.routeReason : '')],
   ]);
 }
 

@@ -44,13 +44,17 @@ const byNumber = (of) => by(of, (left, right) => left - right);
 const words = new Intl.Collator('en', {numeric: true, sensitivity: 'base'});
 const byText = (of) => by((clip) => of(clip) || undefined, words.compare);
 
+// The first timecode that the movie itself has.
+function startText(clip) {
+  return clip.hasTimecode === false ? '' : clip.start || '';
+}
+
 // A column of the table. Its cells have its id as their class, by which narrow screens leave it out.
 const COLUMNS = [
   {id: 'name', title: 'Name', order: byText((clip) => clip.name)},
   {id: 'length', title: 'Length', number: true, order: byNumber((clip) => clip.seconds),
    text: (clip) => durationText(clip.seconds)},
-  {id: 'start', title: 'Timecode', order: byText((clip) => clip.start),
-   text: (clip) => clip.hasTimecode === false ? '' : clip.start || ''},
+  {id: 'start', title: 'Timecode', order: byText(startText), text: startText},
   {id: 'rate', title: 'Rate', number: true, order: byNumber((clip) => ratio(clip.rate) || undefined),
    text: (clip) => rateText(clip.rate)},
   {id: 'raster', title: 'Raster', number: true,

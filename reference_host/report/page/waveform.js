@@ -6,6 +6,7 @@
 const FULL = 255;  // of a level
 
 function levelPath(levels) {
+  if (levels.length === 0) return '';
   const up = levels.map((level, i) => i + ' ' + (FULL - level));
   const down = levels.map((level, i) => i + ' ' + (FULL + level)).reverse();
   return 'M' + [...up, ...down].join('L') + 'Z';

@@ -5,6 +5,7 @@
 import json
 import os
 import shutil
+import tempfile
 
 SKIPPED = 77  # as ctest is told
 
@@ -26,10 +27,18 @@ def why_none():
     for program in ("chromium", "chromedriver"):
         if not shutil.which(program):
             return f"there is no {program} (Debian's packages chromium and chromium-driver)"
+    if os.geteuid() != 0:
+        # Its sandbox needs what not every system lets its users have; without one it runs for root alone.
+        try:
+            start().quit()
+        except WebDriverException as error:
+            return f"Chromium does not start for this user: {str(error).splitlines()[0]}"
     return ""
 
 
 def start():
+    # Chromium leaves folders there, whose names nobody is told.
+    temporary = tempfile.TemporaryDirectory(ignore_cleanup_errors=True)
     options = Options()
     options.binary_location = shutil.which("chromium")
     for argument in ("--headless=new", "--disable-gpu", "--hide-scrollbars", "--disable-dev-shm-usage"):
@@ -37,18 +46,21 @@ def start():
     if os.geteuid() == 0:
         options.add_argument("--no-sandbox")  # which Chromium has for other users alone
     options.set_capability("goog:loggingPrefs", {"browser": "ALL", "performance": "ALL"})
-    return Page(webdriver.Chrome(service=Service(shutil.which("chromedriver")), options=options))
+    service = Service(shutil.which("chromedriver"), env={**os.environ, "TMPDIR": temporary.name})
+    return Page(webdriver.Chrome(service=service, options=options), temporary)
 
 
 class Page:
     """What tests ask of an open page."""
 
-    def __init__(self, driver):
+    def __init__(self, driver, temporary):
         self.driver = driver
+        self.temporary = temporary
         driver.set_script_timeout(60)
 
     def quit(self):
         self.driver.quit()
+        self.temporary.cleanup()
 
     def open(self, file, view="", width=1440, height=900, scheme="light"):
         self.command(

@@ -7,6 +7,7 @@ Opens reports in Chromium and does what people do there. WORK is a folder that s
 Ends with status 77 where there is no browser.
 """
 
+import collections
 import shutil
 import subprocess
 import sys
@@ -22,6 +23,18 @@ HERE = Path(__file__).resolve().parent
 VIEWS = ("", "#/clip/1", "#/clip/8", "#/odd")
 WIDTHS = (360, 1440, 3840)
 NAMES = "tr.clip a.open"
+# The numbers of the clips in the table's order.
+PLACES = "return [...document.querySelectorAll(arguments[0])].map((one) => one.hash.split('/')[2] - 1)"
+# Values that come before smaller ones; texts as a dictionary has them, and numbers in them by their size.
+OUT_OF_ORDER = """
+    const words = new Intl.Collator('en', {numeric: true, sensitivity: 'base'});
+    const compare = (a, b) => typeof a === 'string' ? words.compare(a, b) : a - b;
+    return arguments[0].filter((value, i, all) => i > 0 && compare(all[i - 1], value) > 0)"""
+# What comes of decoding all pictures: their number, or the fault.
+DECODED = """
+    const done = arguments[0];
+    Promise.all([...document.images].map((one) => one.decode()))
+        .then(() => done(document.images.length), (error) => done(String(error)))"""
 
 
 def axe_script(work):
@@ -74,20 +87,23 @@ class ReportInBrowser(unittest.TestCase):
     def test_sorts_by_every_column_both_ways(self):
         self.open(width=3840)
         clips = pages.document(self.report.read_text(encoding="utf-8"))["clips"]
-        told = {"length": "seconds", "size": "size", "date": "date"}
-        for column in self.page.run("return [...document.querySelectorAll('thead th')].map((one) => one.dataset.column)"):
+        columns = self.page.run("return [...document.querySelectorAll('thead th')].map((one) => one.dataset.column)")
+        self.assertCountEqual(columns, pages.COLUMNS)
+        for column in columns:
             selector = f'thead th[data-column="{column}"]'
             directions = set()
             for _ in range(2):
                 self.page.click(selector + " button")
                 direction = self.page.one(selector).get_attribute("aria-sort")
                 directions.add(direction)
-                places = self.page.run(f"return [...document.querySelectorAll('{NAMES}')].map((one) => one.hash.split('/')[2] - 1)")
+                places = self.page.run(PLACES, NAMES)
                 self.assertCountEqual(places, range(len(clips)))
-                if column in told:
-                    values = [clips[place].get(told[column]) for place in places]
-                    known = sorted((value for value in values if value is not None), reverse=direction == "descending")
-                    self.assertEqual(values, known + [None] * (len(values) - len(known)), (column, direction))
+                values = [pages.COLUMNS[column](clips[place]) for place in places]
+                known = [value for value in values if value is not None]
+                self.assertEqual(values, known + [None] * (len(values) - len(known)), (column, direction))
+                if direction == "descending":
+                    known.reverse()
+                self.assertEqual(self.page.run(OUT_OF_ORDER, known), [], (column, direction))
             self.assertEqual(directions, {"ascending", "descending"}, column)
 
     def test_sorts_where_columns_are_hidden(self):
@@ -108,6 +124,10 @@ class ReportInBrowser(unittest.TestCase):
         self.assertTrue(self.page.one(".nothing").is_displayed())
         self.page.click(".nothing button")
         self.assertEqual(len(self.names()), self.count)
+        search.send_keys("undefined")  # of clips without pictures
+        self.page.frame()
+        self.assertEqual(self.names(), [])
+        search.clear()
         search.send_keys("PRORES 1080")
         self.page.frame()
         self.assertEqual(self.names(), ["prores_hq_1080i"])
@@ -123,14 +143,17 @@ class ReportInBrowser(unittest.TestCase):
         self.assertEqual(len(self.names()), self.count)
         self.assertEqual(self.page.all('.chip[aria-pressed="true"]'), [])
 
-    def test_groups_by_folder(self):
+    def test_groups_by_folder_codec_and_rate(self):
         self.open(height=3000)
-        self.page.run("const by = document.querySelector('#group'); by.value = 'folder';"
-                      "by.dispatchEvent(new Event('change'))")
-        self.page.frame()
-        groups = self.page.texts("tr.group bdi")
-        self.assertEqual([Path(group).name for group in groups], ["day 1", "day 2"])
-        self.assertEqual(len(self.names()), self.count)
+        clips = pages.document(self.report.read_text(encoding="utf-8"))["clips"]
+        for grouping, of in pages.GROUPINGS.items():
+            self.page.run("const by = document.querySelector('#group'); by.value = arguments[0];"
+                          "by.dispatchEvent(new Event('change'))", grouping)
+            self.page.frame()
+            told = dict(zip(self.page.texts("tr.group bdi"), self.page.texts("tr.group .count")))
+            counts = collections.Counter(of(clip) for clip in clips)
+            self.assertEqual({group: int(count.split("\u00a0")[0]) for group, count in told.items()}, counts)
+            self.assertEqual(len(self.names()), self.count)
 
     def test_opens_a_clip_and_comes_back_to_it(self):
         self.open()
@@ -163,6 +186,19 @@ class ReportInBrowser(unittest.TestCase):
         told = self.page.one(".warning.bad").text
         self.assertIn("can't be opened", told)
         self.assertEqual(len(self.page.all(".placeholder")), 1)
+
+    def test_tells_why_a_clip_has_no_pictures(self):
+        self.page.open(self.undrawn, "#/clip/1")
+        self.assertRegex(self.page.one(".placeholder").text, "^No pictures. pictures: .*xyz1")
+        self.page.open(self.undrawn)
+        self.assertEqual(self.page.texts(".poster"), ["no picture"])
+
+    def test_draws_sound_without_a_sample(self):
+        wave = {"track": 1, "seconds": 0, "isWhole": True, "lacksSamples": False, "peaks": [], "means": []}
+        page = pages.with_details(self.report, 0, {"waves": [wave]}, self.report.with_name("empty sound.html"))
+        self.page.open(page, "#/clip/1")
+        self.assertEqual(len(self.page.all(".wave path.peak")), 1)
+        self.assertEqual(self.page.complaints(), [])
 
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys
@@ -256,11 +292,22 @@ class ReportInBrowser(unittest.TestCase):
         self.assertLess(len(self.names()), 60)
 
     def test_shows_pictures_that_lie_beside_it(self):
-        self.page.open(self.split, "#/clip/1")
-        self.assertEqual(self.page.complaints(), [])
-        loaded = ("const done = arguments[0]; Promise.all([...document.images].map((one) => one.decode()))"
-                  ".then(() => done(document.images.length), (error) => done(String(error)))")
-        self.assertEqual(self.page.wait(loaded), 10)
+        clips = pages.document(self.split.read_text(encoding="utf-8"))["clips"]
+        posters = sum("poster" in clip for clip in clips)
+        beside = self.split.with_name(self.split.stem + "_files").as_uri() + "/"
+        for view, pictures, files in (("", posters, posters), ("#/clip/1", 10, 1)):
+            self.page.open(self.split, view, height=3000)
+            self.assertEqual(self.page.wait(DECODED), pictures, view)
+            self.assertEqual(self.page.complaints(), [])
+            asked = {url for url in self.page.requests() if url.startswith(beside)}
+            self.assertEqual(len(asked), files, view)
+
+    def test_leaves_no_files_of_the_browser(self):
+        page = browser.start()
+        folder = Path(page.temporary.name)
+        self.assertNotEqual(list(folder.iterdir()), [])
+        page.quit()
+        self.assertFalse(folder.exists())
 
     def test_is_accessible_by_axe(self):
         if not self.axe:
@@ -283,7 +330,9 @@ def main(program, movies, work):
         folder = Path(folder)
         pages.make_movies(Path(movies), folder / "movies")
         ReportInBrowser.report = pages.write(program, folder / "movies", folder / "report.html")
-        ReportInBrowser.split = pages.write(program, folder / "movies", folder / "split.html", "--split")
+        ReportInBrowser.split = pages.write(program, folder / "movies", folder / "a split #1 100%.html", "--split")
+        pages.make_undrawn(Path(movies), folder / "undrawn")
+        ReportInBrowser.undrawn = pages.write(program, folder / "undrawn", folder / "undrawn.html")
         ReportInBrowser.many = pages.multiply(ReportInBrowser.report, 1000, folder / "many.html")
         ReportInBrowser.count = len(pages.document(ReportInBrowser.report.read_text(encoding="utf-8"))["clips"])
         ReportInBrowser.axe, ReportInBrowser.no_axe = axe_script(Path(work))

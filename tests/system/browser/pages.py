@@ -14,6 +14,39 @@ ELEMENT = '<script type="application/json" id="%s">'
 END = "</script>\n"
 
 
+def ratio(clip):
+    numerator, denominator = clip["rate"].split("/")
+    return int(numerator) / int(denominator)
+
+
+def sound(clip):
+    name = clip.get("soundName") or clip.get("soundCodec") or "sound"
+    rate = f", {clip['soundRate'] / 1000:g}\u00a0kHz" if clip.get("soundRate") else ""
+    return f"{name}, {clip['channels']}\u00a0ch{rate}"
+
+
+# What a column of the table goes by; nothing for a clip that has none.
+COLUMNS = {
+    "name": lambda clip: clip["name"],
+    "length": lambda clip: clip.get("seconds"),
+    "start": lambda clip: clip.get("start") if clip.get("hasTimecode", True) else None,
+    "rate": lambda clip: ratio(clip) if "rate" in clip else None,
+    "raster": lambda clip: clip["width"] * clip["height"] if "width" in clip else None,
+    "codec": lambda clip: clip.get("codecName") or clip.get("codec"),
+    "sound": lambda clip: sound(clip) if clip.get("channels") else None,
+    "size": lambda clip: clip.get("size"),
+    "date": lambda clip: clip.get("date"),
+    "warnings": lambda clip: len(clip["warnings"]) + len(clip["traits"]) / 100,
+}
+
+# What clips of a group have in common.
+GROUPINGS = {
+    "folder": lambda clip: clip["folder"],
+    "codec": lambda clip: COLUMNS["codec"](clip) or "No picture",
+    "rate": lambda clip: f"{round(ratio(clip), 3):g}\u00a0fps" if "rate" in clip else "No rate",
+}
+
+
 def make_movies(made, folder):
     """Movies under ordinary and hostile names; one that is none."""
     for name in ("h264_with_aac", "timecode_25", "timecode_2997_drop", "rotated_270", "prores_hq_1080i", "three_sounds"):
@@ -22,6 +55,13 @@ def make_movies(made, folder):
     copy(made, "pcm_u8", folder / "day 2" / f"{TURNED}.mov")
     copy(made, "png_alpha", folder / "day 2" / f"{ARABIC}.mov")
     (folder / "day 2" / "none.mov").write_bytes(b"no movie at all\n" * 100)
+
+
+def make_undrawn(made, folder):
+    """A movie whose codec nobody knows."""
+    folder.mkdir()
+    movie = (made / "png.mov").read_bytes()
+    (folder / "unknown.mov").write_bytes(movie.replace(b"png ", b"xyz1"))
 
 
 def copy(made, name, to):
@@ -53,6 +93,15 @@ def document(text):
 def in_script(value):
     text = json.dumps(value, ensure_ascii=False, separators=(",", ":"))
     return re.sub("[<>&\u2028\u2029]", lambda found: "\\u%04x" % ord(found[0]), text)
+
+
+def with_details(page, number, members, to):
+    """The page, but for members of a clip's details."""
+    text = page.read_text(encoding="utf-8")
+    start, end = element(text, f"clip-{number}")
+    details = dict(json.loads(text[start:end]), **members)
+    to.write_text(text[:start] + in_script(details) + text[end:], encoding="utf-8")
+    return to
 
 
 def multiply(page, count, to):

@@ -57,6 +57,9 @@ NCFRESULT GiveText(INCFUnknown* host, const char* text, INCFString** out) {
         return NCF_OK;
     }
     *out = Service<INCFString>(host, NCFCompID_NCFString);
+    if (*out == nullptr && (Is("volume-creations-refused") || Is("volume-queries-refused"))) {
+        Crash();
+    }
     return *out == nullptr ? NCF_E_OUTOFMEMORY
                            : (*out)->AssignUTF8(kNCFUTF16, text, kNCFZeroTerminated);
 }
@@ -69,20 +72,32 @@ public:
 
     ncfSInt32 GetNumberOfTracks() override { return Is("mapping-tracks") ? -1 : kTracks; }
     NCFRESULT GetNumberOfChannels(ncfUInt32 track, ncfUInt32* channels) override {
+        if (channels == nullptr) {
+            return WithoutOutput();
+        }
         *channels = Is("mapping-samples") ? 0 : 1;
         return Result(track, 0);
     }
     NCFRESULT GetNumberOfSamples(ncfUInt32 track, ncfUInt64* samples) override {
+        if (samples == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *samples = kSamples;
         const bool isSilent = track == 0 && Is("first-track-without-samples");
         return isLost_ || isSilent ? NCF_E_FAIL : Result(track, 0);
     }
     NCFRESULT GetSampleStride(ncfUInt32, ncfUInt64, ncfUInt64*) override { return NCF_E_NOTIMPL; }
     NCFRESULT GetSampleSize(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* size) override {
+        if (size == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *size = kBytes;
         return Result(track, sample);
     }
     NCFRESULT GetSamplePosition(ncfUInt32 track, ncfUInt64 sample, ncfUInt64* position) override {
+        if (position == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         const ncfUInt64 start = Is("mapping-in-file") ? ncfUInt64{1} << 40 : 16;
         *position = start + sample * kBytes;
         if (Is("mapping-other-samples") && sample >= kSamples) {
@@ -141,6 +156,9 @@ private:
     static constexpr ncfUInt64 kSamples = 25;
     static constexpr ncfUInt64 kBytes = 100;
 
+    static NCFRESULT WithoutOutput() {
+        return Is("mapping-null-outputs") ? NCF_OK : NCF_E_INVALIDARG;
+    }
     static NCFRESULT Result(ncfUInt32 track, ncfUInt64 sample) {
         const bool isThere = track < kTracks || Is("mapping-other-tracks");
         return isThere && sample < kSamples ? NCF_OK : NCF_E_FAIL;
@@ -204,8 +222,8 @@ public:
         if (!path_.empty() && !Is("container-path-once")) {
             return NMA_E_ALREADYSET;
         }
-        if (Is("container-takes-path")) {
-            return NCF_E_INVALIDARG;
+        if (path == nullptr || Is("container-takes-path")) {
+            return Is("container-null-arguments") ? NCF_OK : NCF_E_INVALIDARG;
         }
         path_ = PathOf(path);
         if (Is("container-path-copied")) {
@@ -215,6 +233,9 @@ public:
     }
 
     NCFRESULT GetAAFMasterClips(NMA::IAAFClips** clips) override {
+        if (clips == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *clips = nullptr;
         const NCFRESULT result = Describe();
         if (result >= 0) {
@@ -225,10 +246,23 @@ public:
     }
 
     NCFRESULT GetSampleMapping(NMA::ISampleMapping** mapping) override {
+        if (mapping == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *mapping = nullptr;
         if (!IsMovie(path())) {
             return NCF_E_FAIL;
         }
+        if (Is("leaks-mappings")) {
+            Leak();
+        }
+        INCFLock* const lock = Service<INCFLock>(host_.get(), CompID_LockComponent);
+        if (lock == nullptr) {
+            return Is("mapping-creations-refused") || Is("mapping-queries-refused")
+                       ? NCF_OK
+                       : NCF_E_OUTOFMEMORY;
+        }
+        lock->Release();
         auto* const made = new Mapping;
         *mapping = made;
         if (Is("mapping-outlives")) {
@@ -239,6 +273,9 @@ public:
     }
 
     NCFRESULT GetCapabilities(ncfUInt32* flags) override {
+        if (flags == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         if (!Is("container-capabilities")) {
             *flags = 1;
         }
@@ -364,6 +401,10 @@ private:
             }
             return NCF_E_OUTOFMEMORY;
         }
+        lock->Lock();
+        if (!Is("container-locks")) {
+            lock->Unlock();
+        }
         lock->Release();
         DropDescription();
         description_ = NewDescription(file);
@@ -394,6 +435,9 @@ public:
 
     ncfSInt32 GetCount() override { return static_cast<ncfSInt32>(files_.size()); }
     NCFRESULT GetMetadata(ncfSInt32 index, IAAFFile** file) override {
+        if (file == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *file = nullptr;
         if (index < 0 || index >= GetCount()) {
             return Is("volume-clip-index") ? NCF_E_INVALIDARG : NCF_E_NOTFOUND;
@@ -414,6 +458,9 @@ public:
     NCFRESULT GetClipPath(ncfSInt32 index, INCFString* path) override {
         if (index < 0 || index >= GetCount()) {
             return NCF_E_NOTFOUND;
+        }
+        if (path == nullptr) {
+            return NCF_E_INVALIDARG;
         }
         const auto at = static_cast<std::size_t>(Is("volume-clip-paths") ? 0 : index);
         return path->Assign(host::ModulePath(files_[at]).get());
@@ -442,6 +489,9 @@ public:
     NCFRESULT FormatUnsupportedA(void*) override { return NCF_E_FAIL; }
     NCFRESULT FormatUnsupportedB(void*) override { return NCF_E_FAIL; }
     NCFRESULT GetAAFClips(NMA::IAAFClips** clips) override {
+        if (clips == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         auto* const made = new FolderClips(folder_);
         if (Is("volume-format")) {
             made->Forget();
@@ -467,15 +517,26 @@ public:
     explicit VolumeInfo(INCFUnknown* host) : Object(nullptr), host_(host) {}
 
     NCFRESULT GetSerialNumber(ncfUInt32* serial) override {
+        if (serial == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *serial = 0;
         return NCF_OK;
     }
-    NCFRESULT GetLabel(INCFString** label) override { return GiveText(host_.get(), "", label); }
+    NCFRESULT GetLabel(INCFString** label) override {
+        return label == nullptr ? NCF_E_INVALIDARG : GiveText(host_.get(), "", label);
+    }
     NCFRESULT GetType(ncfUInt32* type) override {
+        if (type == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *type = Is("volume-info") ? 7 : 3;
         return NCF_OK;
     }
     NCFRESULT GetModificationDate(ncfUInt32* date) override {
+        if (date == nullptr) {
+            return Is("volume-null-arguments") ? NCF_OK : NCF_E_INVALIDARG;
+        }
         *date = 1;
         return NCF_OK;
     }
@@ -501,7 +562,7 @@ public:
     }
 
     NCFRESULT IsMediaVolume(INCFString* path) override {
-        if (Is("volume-claims") || (Is("volume-claims-again") && wasAsked_)) {
+        if (path == nullptr || Is("volume-claims") || (Is("volume-claims-again") && wasAsked_)) {
             return 0;
         }
         wasAsked_ = true;
@@ -513,15 +574,27 @@ public:
         }
         return Is("volume-other-folders") ? 1 : 0;
     }
-    NCFRESULT GetVolumeInfo(INCFString*, NMA::IVolumeInfo** info) override {
+    NCFRESULT GetVolumeInfo(INCFString* path, NMA::IVolumeInfo** info) override {
+        if (path == nullptr || info == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
+        if (Is("leaks-volumes")) {
+            Leak();
+        }
         *info = new VolumeInfo(host_.get());
         return NCF_OK;
     }
     NCFRESULT GetMediaFormat(INCFString* path, NMA::IMediaFormat** format) override {
+        if (path == nullptr || format == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *format = new Format(PathOf(path));
         return NCF_OK;
     }
     NCFRESULT GetContainerComponentId(GUID* id) override {
+        if (id == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *id = Is("volume-container-id") ? kContainerClass : kContainerComponent;
         return NCF_OK;
     }

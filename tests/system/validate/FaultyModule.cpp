@@ -132,6 +132,20 @@ struct AtTheEdges {
     }
 } edges;
 
+// Queries the host once, then twice, and so on; whether it answered all.
+bool AskMoreEachTime(INCFUnknown* host) {
+    static int times = 0;
+    ++times;
+    for (int i = 0; i < times; ++i) {
+        void* factory = nullptr;
+        if (host->QueryInterface(IID_INCFComponentFactory, &factory) < 0) {
+            return false;
+        }
+        static_cast<INCFUnknown*>(factory)->Release();
+    }
+    return true;
+}
+
 class Thing final : public Object {
 public:
     static NCFRESULT Make(INCFUnknown* host, INCFUnknown* outer, Object** made) {
@@ -154,6 +168,17 @@ public:
         }
         if (Is("leaks-objects")) {
             Leak();
+        }
+        if (Is("order-creation-not-started") && !TheState().isStarted) {
+            Crash();
+        }
+        if (Is("queries-without-end") && !AskMoreEachTime(host)) {
+            thing->OwnRelease();
+            return NCF_E_OUTOFMEMORY;
+        }
+        thing->lock_->Lock();
+        if (!Is("objects-locks")) {
+            thing->lock_->Unlock();
         }
         *made = thing;
         return NCF_OK;
@@ -185,7 +210,12 @@ public:
                              void** out) override;
 
 private:
-    ~ClassFactory() override { TheState().isFactoryGone = true; }
+    ~ClassFactory() override {
+        TheState().isFactoryGone = true;
+        if (Is("factory-counted-each")) {
+            TheState().liveObjects = 1;  // the base takes that off
+        }
+    }
     Object& self() override { return *this; }
     INCFUnknown* Find(const GUID& iid) override {
         return iid == IID_INCFClassFactory ? this : nullptr;
@@ -361,6 +391,9 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterPlugin(INCFUnknown* host, INCFPluginDefin
     }
     *out = nullptr;
     TheState().isRegistered = true;
+    if (Is("order-plugin-registration-on-two-threads") && !IsFirstThread()) {
+        return NCF_E_UNEXPECTED;
+    }
     if (Is("plugin-definition")) {
         static OwnDefinition own;
         *out = &own;
@@ -446,7 +479,8 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFCanUnloadNow(INCFUnknown* host) {
         return Is("unload-null-host") ? NCF_OK : NCF_E_INVALIDARG;
     }
     ++state.questions;
-    const bool isAlone = state.liveObjects == 0;
+    const bool isAlone =
+        state.liveObjects == 0 && !(Is("order-unload-question-on-two-threads") && !IsFirstThread());
     const bool isAllowed =
         Is("unload-refused") || (isAlone && !Is("unload-allowed") &&
                                  !(Is("order-unload-question-first") && !state.isStarted));

@@ -28,11 +28,11 @@ struct State {
     std::atomic<int> liveObjects{0};
     std::atomic<int> liveThings{0};
     std::atomic<bool> isFactoryGone{false};
-    bool isRegistered = false;
+    std::atomic<bool> isRegistered{false};
     bool isStarted = false;
     bool wasShutDown = false;
-    bool wasRefused = false;  // by NCFCanUnloadNow
-    int questions = 0;
+    std::atomic<bool> wasRefused{false};  // by NCFCanUnloadNow
+    std::atomic<int> questions{0};
     std::atomic<void*> forgotten{nullptr};  // the last thing that nobody gives back
 };
 State& TheState();

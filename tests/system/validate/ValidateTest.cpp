@@ -67,12 +67,15 @@ constexpr Row kRows[] = {
     {"order-registration-after-start"},
     {"order-start-without-registration"},
     {"order-factory-not-started", "crashed"},
+    {"order-creation-not-started", "crashed"},
     {"order-start-twice"},
     {"order-shutdown-twice", "crashed"},
     {"order-start-again"},
     {"order-shutdown-with-objects", "crashed"},
     {"order-other-thread"},
     {"order-registration-on-two-threads"},
+    {"order-plugin-registration-on-two-threads"},
+    {"order-unload-question-on-two-threads"},
     {"order-creation-on-threads"},
     {"order-no-thread"},
     {"plugin-definition"},
@@ -105,6 +108,7 @@ constexpr Row kRows[] = {
     {"factory-interfaces"},
     {"factory-kept"},
     {"factory-refuses-unloading"},
+    {"factory-counted-each"},
     {"factory-released-first"},
     {"create-null-host", "crashed"},
     {"create-null-output"},
@@ -124,6 +128,7 @@ constexpr Row kRows[] = {
     {"counts-end"},
     {"counts-on-threads"},
     {"objects-many"},
+    {"objects-locks"},
     {"unload-null-host"},
     {"unload-refused"},
     {"unload-allowed"},
@@ -135,6 +140,7 @@ constexpr Row kRows[] = {
     {"volume-claims"},
     {"volume-claims-again"},
     {"volume-other-folders"},
+    {"volume-null-arguments"},
     {"volume-info"},
     {"volume-format"},
     {"volume-clip-paths"},
@@ -142,6 +148,8 @@ constexpr Row kRows[] = {
     {"volume-clip-descriptions"},
     {"volume-container-id"},
     {"volume-bad-files", "crashed"},
+    {"volume-creations-refused", "crashed"},
+    {"volume-queries-refused", "crashed"},
     {"volume-released-first"},
     {"container-file-types", "crashed"},
     {"container-capabilities"},
@@ -150,6 +158,8 @@ constexpr Row kRows[] = {
     {"container-path-once"},
     {"container-path-copied"},
     {"container-without-path"},
+    {"container-null-arguments"},
+    {"container-locks"},
     {"container-missing-file"},
     {"container-supports"},
     {"container-describes-again"},
@@ -173,6 +183,9 @@ constexpr Row kRows[] = {
     {"mapping-in-file"},
     {"mapping-other-tracks"},
     {"mapping-other-samples"},
+    {"mapping-null-outputs"},
+    {"mapping-creations-refused"},
+    {"mapping-queries-refused"},
     {"mapping-outlives"},
     {"files-broken", "crashed"},
     {"files-hostile", "timedOut"},
@@ -184,6 +197,8 @@ constexpr Row kRows[] = {
     {"leaks-objects"},
     {"leaks-refused-creation"},
     {"leaks-descriptions"},
+    {"leaks-mappings"},
+    {"leaks-volumes"},
     {"leaks-broken-files"},
     {"fuzz-calls", "crashed"},
     {"fuzz-movies", "crashed"},
@@ -276,8 +291,9 @@ TEST_F(Validates, AndPassesThePlugin) {
     EXPECT_EQ(CountsOf(kOurs)["passed"], std::size(kRows));
 }
 
-TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
-    const json counts = CountsOf(kMinimal);
+// Modules of objects that can't be aggregated, and without media.
+void ExpectMediaAreSkipped(const std::filesystem::path& module) {
+    const json counts = CountsOf(module);
     std::size_t media = 2;  // it makes objects that can't be aggregated
     for (const Row& row : kRows) {
         const std::string id = row.id;
@@ -286,9 +302,17 @@ TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
             media += id.rfind(group, 0) == 0 ? 1 : 0;
         }
     }
-    media += 3;  // leaks-descriptions, leaks-broken-files, fuzz-movies
+    media += 5;  // leaks-descriptions, -mappings, -volumes, -broken-files, fuzz-movies
     EXPECT_EQ(counts["skipped"], media);
     EXPECT_EQ(counts["passed"], std::size(kRows) - media);
+}
+
+TEST_F(Validates, AndSkipsTheMediaOfAModuleThatHasNone) {
+    ExpectMediaAreSkipped(kMinimal);
+}
+
+TEST_F(Validates, AndPassesTheTinyModuleOfTheUnitTests) {
+    ExpectMediaAreSkipped(Faulty("tiny_file_none"));
 }
 
 TEST_F(Validates, AFileThatIsNoModuleByOneCheckAndSkipsTheRest) {
@@ -362,8 +386,13 @@ TEST_F(Validates, AndACrashCostsOneCheckAlone) {
 }
 
 TEST_F(Validates, AndABadEndAfterAPassIsACrash) {
-    for (const auto& [fault, found] : {std::pair("end-crashes", "ended by signal 11"),
-                                       std::pair("end-has-status", "ended with status 3")}) {
+    const struct {
+        const char* fault;
+        const char* found;
+        const char* cause;
+    } rows[] = {{"end-crashes", "ended by signal 11", "a pointer is used that is null"},
+                {"end-has-status", "ended with status 3", "ends the whole process (exit)"}};
+    for (const auto& [fault, found, cause] : rows) {
         setenv("CLIPHOST_FAULT", fault, 1);
         const Answer answer = Validate(Faulty("FaultyModule"), "--only plugin-names");
         EXPECT_EQ(answer.status, 1);
@@ -371,7 +400,19 @@ TEST_F(Validates, AndABadEndAfterAPassIsACrash) {
         EXPECT_EQ(check["verdict"], "crashed");
         EXPECT_EQ(check["done"], "ending the process after the check");
         EXPECT_NE(check.value("found", "").find(found), std::string::npos) << check.dump(2);
+        EXPECT_NE(check.value("cause", "").find(cause), std::string::npos) << check.dump(2);
+        EXPECT_NE(check.value("cause", "").find("a global object's destructor"), std::string::npos);
     }
+}
+
+TEST_F(Validates, AndTellsWhatACrashIsDueToBeforeWhatTheCheckLooksFor) {
+    setenv("CLIPHOST_FAULT", "order-shutdown-twice", 1);
+    const std::string cause = Validate(Faulty("FaultyModule"), "--only order-shutdown-twice")
+                                  .Of("order-shutdown-twice")
+                                  .value("cause", "");
+    EXPECT_EQ(cause,
+              "a pointer is used that is null, or that leads to something that is gone; behind it "
+              "may be what this check looks for: what was released is released again");
 }
 
 TEST_F(Validates, AndABadEndDoesNotHideAFault) {
@@ -398,6 +439,17 @@ TEST_F(Validates, AndWarnsWhereCallsHaveNoEnd) {
     EXPECT_EQ(answer.status, 0);
     const json check = answer.Of("refusal-definition-calls");
     EXPECT_EQ(check["verdict"], "warning") << check.dump(2);
+    EXPECT_EQ(check["found"], "there are more, which were not refused");
+}
+
+TEST_F(Validates, AndWarnsWhereQueriesHaveNoEnd) {
+    setenv("CLIPHOST_FAULT", "queries-without-end", 1);
+    const Answer answer =
+        Validate(Faulty("FaultyModule"), "--only refusal-query --limit-seconds 100000");
+    EXPECT_EQ(answer.status, 0);
+    const json check = answer.Of("refusal-query");
+    EXPECT_EQ(check["verdict"], "warning") << check.dump(2);
+    EXPECT_EQ(check["expected"], "no more than 5000 calls of the host");
     EXPECT_EQ(check["found"], "there are more, which were not refused");
 }
 
@@ -462,10 +514,20 @@ TEST_F(Validates, AndBlamesNoModuleForFilesThatItCannotWriteItself) {
             "ulimit -f 2; " + Quoted(ProgramFolder() / "cliphost") + " validate " +
             Quoted(Faulty("FaultyModule")) +
             " --only files-broken --only volume-info --only container-path-once" + given);
-        ExpectSays(ran, 0, "3 checks: 0 passed, 0 failed, 0 crashed, 0 timed out, 0 warning, 3");
-        ExpectSays(ran, 0, "because   the checker can't write ");
-        ExpectSays(ran, 0, "whole.mov: File too large; name another folder in TMPDIR\n");
+        ExpectSays(ran, 2, "3 checks: 0 passed, 0 failed, 0 crashed, 0 timed out, 0 warning, 3");
+        ExpectSays(ran, 2, "because   the checker can't write ");
+        ExpectSays(ran, 2, "whole.mov: File too large; name another folder in TMPDIR\n");
     }
+}
+
+TEST_F(Validates, AndPassesNothingWhereAllIsSkipped) {
+    const std::string call = "validate " + Quoted(kMinimal) + " --only volume-info";
+    for (const char* const given : {"", " --in-process", " --json"}) {
+        SCOPED_TRACE(given);
+        ExpectSays(RunCliphost(call + given), 2,
+                   "MinimalModule.nvx: nothing was checked: all checks were skipped, and say why");
+    }
+    ExpectSays(RunCliphost(call + " --only plugin-id"), 0, "2 checks: 1 passed");
 }
 
 TEST_F(Validates, AndTellsWhenItsAnswerCannotBeWritten) {

@@ -36,6 +36,26 @@ TEST(ListMatching, FindsOneOfAnotherKeyByItsContentWhereThatMayBe) {
     EXPECT_EQ(MatchLists({Keyed("3", 7)}, {Keyed("4", 7)}, false), Places{kNone});
 }
 
+// "2" is that of another one now.
+TEST(ListMatching, TakesAsManyWithOtherKeysInTheirOrderWhereKeysMayChange) {
+    EXPECT_EQ(MatchLists({Keyed("1", 7, true), Keyed("2", 7, true)},
+                         {Keyed("2", 7, true), Keyed("3", 7, true)}, false),
+              (Places{0, 1}));
+    EXPECT_EQ(MatchLists({Keyed("1", 7, true)}, {Keyed("3", 9, true)}, false), Places{0});
+    EXPECT_EQ(MatchLists({Keyed("1")}, {Keyed("3")}, false), Places{kNone});
+}
+
+TEST(ListMatching, GoesByKeysWhereTheyAreTheSameOrMoreOrFewer) {
+    EXPECT_EQ(MatchLists({Keyed("1", 7, true), Keyed("2", 8, true)},
+                         {Keyed("2", 9, true), Keyed("1", 9, true)}, false),
+              (Places{1, 0}));
+    EXPECT_EQ(MatchLists({Keyed("2", 8, true)}, {Keyed("1", 9, true), Keyed("2", 9, true)}, false),
+              Places{1});
+    EXPECT_EQ(MatchLists({Keyed("2", 8, true)}, {Keyed("3", 9, true), Keyed("4", 9, true)}, false),
+              Places{kNone})
+        << "of two, nobody knows which";
+}
+
 TEST(ListMatching, NeverTakesOneKindForAnother) {
     EXPECT_EQ(MatchLists({Loose(1, "clip")}, {Loose(1, "gap")}, false), Places{kNone});
     EXPECT_EQ(MatchLists({{"1", 0, "picture", true}}, {{"1", 0, "sound", true}}, false),

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "reference_host/cliphost/AafValue.h"
 
@@ -99,6 +101,35 @@ TEST(TreeDifferences, FindASlotThatHasAnotherNumberNow) {
               (Texts{"picture slot 1: slot id 1 -> 2", "sound slot 1 new"}));
 }
 
+// The slots behind it are numbered anew.
+TEST(TreeDifferences, TellASlotThatWentAndAChangeInOneBehindIt) {
+    EXPECT_EQ(Differences(Mob({Timecode("1"), Timecode("2", "9"), Picture("3", "250")}),
+                          Mob({Timecode("1"), Picture("2", "251")})),
+              (Texts{"second timecode slot (2) gone", "picture slot 3: slot id 3 -> 2",
+                     "picture slot 3: length 250 -> 251"}));
+}
+
+TEST(TreeDifferences, KeepTheOrderOfSlotsThatAreNumberedAnew) {
+    EXPECT_EQ(Differences(Mob({Sound("2", "8"), Sound("3", "9")}),
+                          Mob({Picture("2"), Sound("3", "8"), Sound("4", "9")})),
+              (Texts{"first sound slot (2): slot id 2 -> 3",
+                     "second sound slot (3): slot id 3 -> 4", "picture slot 2 new"}));
+}
+
+// The mob that a slot leads to has other numbers, too.
+TEST(TreeDifferences, FindASlotThatLeadsToAnotherNumber) {
+    const auto leading = [](const std::string& id, const std::string& to,
+                            const std::string& length) {
+        TreeNode slot = Sound(id, length);
+        slot.branches[0].nodes[0].facts.push_back({"SourceMobSlotID", to});
+        return slot;
+    };
+    EXPECT_EQ(Differences(Mob({leading("4", "3", "8"), leading("5", "4", "9")}),
+                          Mob({leading("3", "2", "9")})),
+              (Texts{"first sound slot (4) gone", "second sound slot (5): slot id 5 -> 3",
+                     "second sound slot (5): source mob slot id 4 -> 2"}));
+}
+
 TEST(TreeDifferences, TellASlotThatHoldsAnotherKindAsGoneAndNew) {
     EXPECT_EQ(Differences(Mob({Picture("1", "250")}), Mob({Sound("1", "7")})),
               (Texts{"picture slot 1 gone", "sound slot 1 new"}));
@@ -189,6 +220,30 @@ TEST(TreeDifferences, ShowLongValuesWhereTheyBeginToDiffer) {
     EXPECT_LT(texts[0].size(), 500u);
     EXPECT_NE(texts[0].find("..." + std::string(30, 'x') + "first"), std::string::npos) << texts[0];
     EXPECT_NE(texts[0].find("second"), std::string::npos) << texts[0];
+}
+
+TEST(TreeDifferences, CutLongNames) {
+    const std::string name(1u << 20, 'x');
+    TreeComparison([&](const TreeDifference& one) {
+        ASSERT_EQ(one.place.size(), 1u);
+        EXPECT_LT(one.place[0].size(), 500u);
+    }).Compare(Comments({Comment(name, "1")}), Comments({Comment(name, "2")}));
+    const auto longest = [](const Texts& texts) {
+        std::size_t most = 0;
+        for (const std::string& text : texts) {
+            most = std::max(most, text.size());
+        }
+        return most;
+    };
+    EXPECT_LT(longest(Differences(Node("Mob", {{name, "1"}}), Node("Mob", {{name, "2"}}))), 500u);
+    EXPECT_LT(longest(Differences(Sequence({Part(name, "1")}), Sequence({Part("Filler", "2")}))),
+              500u);
+    const auto slot = [&](const char* length) {
+        TreeNode one = Sound("1", length);
+        one.branches[0].nodes[0].facts[0].value = name;
+        return one;
+    };
+    EXPECT_LT(longest(Differences(Mob({slot("1")}), Mob({slot("2")}))), 500u);
 }
 
 TEST(TreeDifferences, CutLongValuesBetweenCharacters) {

@@ -18,6 +18,7 @@ using ::testing::Contains;
 using ::testing::ElementsAre;
 using ::testing::HasSubstr;
 using ::testing::IsEmpty;
+using ::testing::Not;
 using Texts = std::vector<std::string>;
 
 // Each on one line as "file:line:column: what; what helps".
@@ -112,7 +113,7 @@ TEST_F(DataChecks, TellWhereAMistakeIsAndWhatHelps) {
         TextsOf(CheckFiles("<Map>\n  <FourCharMapping FourChar='dvc '\n      vcid='0'/>\n</Map>",
                            "<Infos>\n" + Record(Good()) + "</Infos>"));
     EXPECT_THAT(texts, ElementsAre("FourCharMapper.xml:3:7: vcid can't be \"0\"; give a whole "
-                                   "number above 0, or leave it out"));
+                                   "number from 1 to 2147483647, or leave it out"));
 }
 
 TEST_F(DataChecks, FindValuesThatAnAafLibraryRefuses) {
@@ -128,6 +129,8 @@ TEST_F(DataChecks, FindValuesThatAnAafLibraryRefuses) {
                                                           {"ComponentDepth", "17"},
                                                           {"ColorRange", "x"},
                                                           {"ColorRange", "4294967296"},
+                                                          {"ColorRange", "99999999999999999999"},
+                                                          {"ColorRange", "+897"},
                                                           {"ColorRange", "0897"},
                                                           {"BlackRefLevel", "-1"}}) {
         EXPECT_THAT(Check(Record(With(name, value))),
@@ -141,9 +144,20 @@ TEST_F(DataChecks, AcceptTheRestOfTheirRanges) {
                                                           {"ColorSiting", "255"},
                                                           {"HorizontalSubsampling", "4"},
                                                           {"VerticalSubsampling", "2"},
-                                                          {"FrameLayout", "4"}}) {
+                                                          {"FrameLayout", "4"},
+                                                          {"ImageStartOffset", "0"},
+                                                          {"ImageStartOffset", "4294967295"}}) {
         EXPECT_THAT(Check(Record(With(name, value))), IsEmpty()) << name << value;
     }
+}
+
+// The module writes ids as signed numbers when it compares them.
+TEST_F(DataChecks, FindIdsThatTheModuleCanNotFind) {
+    EXPECT_THAT(Check(Record(Good(), "2147483647"), Row("dvc ", "vcid='2147483647'")), IsEmpty());
+    EXPECT_THAT(Check(Record(Good(), "2147483648"), Row("dvc ", "vcid='2147483648'")),
+                ElementsAre(HasSubstr("vcid can't be \"2147483648\"; give a whole number from 1 to "
+                                      "2147483647"),
+                            HasSubstr("ResolutionID can't be \"2147483648\"")));
 }
 
 TEST_F(DataChecks, FindEveryValueThatARecordMustHave) {
@@ -179,6 +193,104 @@ TEST_F(DataChecks, FindLayoutsWithTooManyComponentsAndLongCodes) {
                 AllOf(Contains(HasSubstr("rp210:PixelLayout has 9 components")),
                       Contains(HasSubstr("rp210:Code is more than one letter")),
                       Contains(HasSubstr("rp210:Depth can't be \"65\""))));
+}
+
+TEST_F(DataChecks, FindLevelsThatTheDepthHasNoRoomFor) {
+    EXPECT_THAT(Check(Record(With("WhiteReflevel", "1024"))),
+                ElementsAre(HasSubstr("rp210:WhiteReflevel can't be 1024: components have 10 bits; "
+                                      "give 1023 at most")));
+    EXPECT_THAT(Check(Record(With("ColorRange", "1024"))),
+                ElementsAre(HasSubstr("rp210:ColorRange can't be 1024: ")));
+    EXPECT_THAT(Check(Record(With("WhiteReflevel", "1023"))), IsEmpty());
+    EXPECT_THAT(Check(Record(With("ComponentDepth", "x"))),
+                ElementsAre(HasSubstr("rp210:ComponentDepth can't be \"x\"")));
+}
+
+TEST_F(DataChecks, FindABlackLevelThatIsNotBelowWhite) {
+    for (const char* const black : {"940", "1000"}) {
+        EXPECT_THAT(Check(Record(With("BlackRefLevel", black))),
+                    ElementsAre(HasSubstr("rp210:BlackRefLevel can't be " + std::string(black) +
+                                          ": rp210:WhiteReflevel is 940; give 939 at most")));
+    }
+    EXPECT_THAT(Check(Record(With("BlackRefLevel", "939"))), IsEmpty());
+}
+
+TEST_F(DataChecks, FindSizesLargerThanWhatIsStored) {
+    EXPECT_THAT(Check(Record(With("SampledWidth", "721"))),
+                ElementsAre(HasSubstr("rp210:SampledWidth can't be 721: rp210:StoredWidth is 720; "
+                                      "give 720 at most, or correct the other value")));
+    EXPECT_THAT(Check(Record(With("DisplayWidth", "1440"))),
+                ElementsAre(HasSubstr("rp210:DisplayWidth can't be 1440: ")));
+    EXPECT_THAT(Check(Record(With("DisplayHeight", "481"))),
+                ElementsAre(HasSubstr("rp210:DisplayHeight can't be 481: rp210:StoredHeight is")));
+    EXPECT_THAT(
+        Check(Record(With("DisplayYOffset", "1"))),
+        ElementsAre(HasSubstr("rp210:DisplayYOffset can't be 1: 480 of 480 lines are shown; "
+                              "give 0 at most")));
+    Values values = With("DisplayHeight", "470");
+    values["rp210:DisplayYOffset"] = "10";
+    EXPECT_THAT(Check(Record(values)), IsEmpty());
+    values["rp210:DisplayYOffset"] = "4294967295";
+    EXPECT_THAT(Check(Record(values)), ElementsAre(HasSubstr("give 10 at most")));
+}
+
+TEST_F(DataChecks, FindFieldsWithoutALineForEach) {
+    EXPECT_THAT(Check(Record(With("FrameLayout", "1"))),
+                ElementsAre(HasSubstr("rp210:VideoLineMap has no line for the second field")));
+}
+
+// None of the shipped records is of this kind.
+class RgbaRecords : public DataChecks {
+protected:
+    static std::string Component(const std::string& code, const std::string& depth = "8") {
+        return "<rp210:RGBALayout rp210:Code='" + code + "' rp210:Depth='" + depth + "'/>";
+    }
+    Texts CheckRgba(const std::string& components, const std::string& black = "16",
+                    const std::string& white = "235") {
+        Values values = Good();
+        for (const char* const name :
+             {"rp210:ComponentDepth", "rp210:HorizontalSubsampling", "rp210:VerticalSubsampling",
+              "rp210:ColorSiting", "rp210:ColorRange", "rp210:BlackRefLevel",
+              "rp210:WhiteReflevel"}) {
+            values.erase(name);
+        }
+        values["rp210:ComponentMinRef"] = black;
+        values["rp210:ComponentMaxRef"] = white;
+        return Check(Record(values, "10000", "RGBA",
+                            "<rp210:VideoLineMap><rp210:Element>23</rp210:Element>"
+                            "</rp210:VideoLineMap><rp210:PixelLayout>" +
+                                components + "</rp210:PixelLayout>"));
+    }
+    const std::string rgb_ = Component("R") + Component("G") + Component("B");
+};
+
+TEST_F(RgbaRecords, AreFineWithThreeColoursOrAPalette) {
+    EXPECT_THAT(CheckRgba(rgb_), IsEmpty());
+    EXPECT_THAT(CheckRgba(rgb_ + Component("F") + Component("A") + Component("F")), IsEmpty());
+    EXPECT_THAT(CheckRgba(Component("P")), IsEmpty());
+    EXPECT_THAT(CheckRgba(rgb_, "0", "255"), IsEmpty());
+}
+
+TEST_F(RgbaRecords, AreToldForLevelsThatTheirComponentsHaveNoRoomFor) {
+    EXPECT_THAT(
+        CheckRgba(rgb_, "16", "256"),
+        ElementsAre(HasSubstr("rp210:ComponentMaxRef can't be 256: components have 8 bits")));
+    EXPECT_THAT(CheckRgba(rgb_ + Component("A", "10"), "16", "256"), IsEmpty());
+    EXPECT_THAT(
+        CheckRgba(rgb_, "235", "235"),
+        ElementsAre(HasSubstr("rp210:ComponentMinRef can't be 235: rp210:ComponentMaxRef")));
+}
+
+TEST_F(RgbaRecords, AreToldForComponentsThatMakeNoPicture) {
+    EXPECT_THAT(CheckRgba(rgb_ + Component("X")),
+                ElementsAre(HasSubstr("rp210:Code can't be \"X\"; give R, G, B, A (alpha)")));
+    EXPECT_THAT(CheckRgba(rgb_ + Component("G")),
+                ElementsAre(HasSubstr("G stands here a second time")));
+    EXPECT_THAT(CheckRgba(Component("R") + Component("B")),
+                ElementsAre(HasSubstr("rp210:PixelLayout has no G")));
+    EXPECT_THAT(CheckRgba(rgb_ + Component("")),
+                ElementsAre(HasSubstr("rp210:Code is empty or has blanks around it")));
+    EXPECT_THAT(CheckRgba(""), Contains(HasSubstr("rp210:PixelLayout has 0 components")));
 }
 
 TEST_F(DataChecks, FindLabelsThatComeOutWrong) {
@@ -218,17 +330,47 @@ TEST_F(DataChecks, FindNamesThatMeanNothingAndTellTheRightOne) {
                 Contains(HasSubstr("Line means nothing here")));
 }
 
+// The module passes over an element that it does not know, and reads what is in it.
+TEST_F(DataChecks, TakeEntriesOutOfElementsAroundThem) {
+    EXPECT_THAT(Check("<Group><More>" + Record(Good()) + "</More></Group>",
+                      "<DV>" + Row("dvc ", "vcid='10000'") + "</DV>"),
+                IsEmpty());
+    EXPECT_THAT(Check("<Group>\n<x><y/></x>" + Record(Good()) + "</Group>"),
+                ElementsAre(HasSubstr("AAFInfo.xml:3:1: x means nothing here")));
+}
+
 TEST_F(DataChecks, FindBlanksAroundAValue) {
     EXPECT_THAT(Check(Record(With("ColorSiting", "0 "))),
-                Contains(HasSubstr("rp210:ColorSiting is empty or has blanks around it")));
+                ElementsAre(HasSubstr("rp210:ColorSiting is empty or has blanks around it")));
+    EXPECT_THAT(Check(Record(With("PictureEssenceCoding", ""))),
+                ElementsAre(HasSubstr("PictureEssenceCoding is empty or has blanks around it")));
+    EXPECT_THAT(Check(Record(With("StoredWidth", " 720"))),
+                ElementsAre(HasSubstr("rp210:StoredWidth is empty or has blanks around it")));
     EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
                              "<rp210:VideoLineMap><rp210:Element>\n 23</rp210:Element>"
                              "</rp210:VideoLineMap>")),
-                Contains(HasSubstr("rp210:Element is empty or has blanks around it")));
+                ElementsAre(HasSubstr("rp210:Element is empty or has blanks around it")));
     EXPECT_THAT(Check(Record(Good()),
                       "<FourCharMapping FourChar='dvc '><vcid>10000</vcid><Vendor/>"
                       "</FourCharMapping>"),
-                Contains(HasSubstr("Vendor is empty or has blanks around it")));
+                ElementsAre(HasSubstr("Vendor is empty or has blanks around it")));
+}
+
+TEST_F(DataChecks, FindLinesThatAreNoNumbersByTheirPlaces) {
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
+                             "<rp210:VideoLineMap>\n<rp210:Element>x</rp210:Element>"
+                             "</rp210:VideoLineMap>")),
+                ElementsAre(HasSubstr("AAFInfo.xml:3:1: rp210:Element can't be \"x\"; give a whole "
+                                      "number")));
+}
+
+// Of an element with an attribute, the module takes that for the value.
+TEST_F(DataChecks, FindAttributesOfValues) {
+    EXPECT_THAT(Check(Record(Good()),
+                      "<FourCharMapping FourChar='dvc '><vcid note='x'>10000</vcid>"
+                      "</FourCharMapping>"),
+                ElementsAre(HasSubstr("FourCharMapper.xml:2:40: vcid would get the value of note; "
+                                      "take the attribute out")));
 }
 
 TEST_F(DataChecks, FindWhatStandsThereTwice) {
@@ -255,6 +397,10 @@ TEST_F(DataChecks, FindEntriesWithoutKeyOrDescriptor) {
                 Contains(HasSubstr("FourCharMapping lacks FourChar")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc", "vcid='1'")),
                 Contains(HasSubstr("FourChar must have four characters, not \"dvc\"")));
+    EXPECT_THAT(
+        Check(Record(Good()), Row("dv\xC3\xA9 ", "vcid='1'")),
+        Contains(HasSubstr("not \"dv\xC3\xA9 \"; write the four characters of the code, each "
+                           "of one byte")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10000' Vendor='applX'")),
                 Contains(HasSubstr("of Vendor only \"appl\" counts")));
 }
@@ -272,17 +418,41 @@ TEST_F(DataChecks, FindARepeatThatServesNothing) {
                 Contains(AllOf(HasSubstr("AAFInfo.xml:4:1: "), HasSubstr("it is a repeat"))));
 }
 
+TEST_F(DataChecks, FindTwoRecordsOfOnePictureThatDiffer) {
+    const std::string other = Record(With("ColorSiting", "4"));
+    EXPECT_THAT(Check(Record(Good()) + other),
+                ElementsAre(AllOf(HasSubstr("AAFInfo.xml:3:1: a picture of 720x480"),
+                                  HasSubstr("line 2 instead of this one; make the two alike"))));
+    EXPECT_THAT(
+        Check(Record(Good()) + Record(Good()) + other),
+        ElementsAre(HasSubstr("AAFInfo.xml:3:1: "),
+                    AllOf(HasSubstr("AAFInfo.xml:4:1: "), HasSubstr("make the two alike"))));
+    // The same in another form is no other record.
+    Values values = Good();
+    values.erase("rp210:ColorSiting");
+    EXPECT_THAT(
+        Check(Record(Good()) + Record(values, "10000", "CDCI",
+                                      "<rp210:ColorSiting>0</rp210:ColorSiting><rp210:VideoLineMap>"
+                                      "<rp210:Element>23</rp210:Element></rp210:VideoLineMap>")),
+        IsEmpty());
+    EXPECT_THAT(
+        Check(Record(Good()) + Record(Good(), "10000", "CDCI",
+                                      "<rp210:VideoLineMap><rp210:Element>24</rp210:Element>"
+                                      "</rp210:VideoLineMap>")),
+        ElementsAre(HasSubstr("make the two alike")));
+}
+
 TEST_F(DataChecks, FindRecordsBehindOthers) {
     const auto inLineTwo = HasSubstr("finds the record of id 10000 in line 2 instead of this one");
     // 486 lines pass for 480 by the rule of six lines more.
     EXPECT_THAT(Check(Record(Sized("720", "480")) + Record(Sized("720", "486"))),
                 Contains(AllOf(HasSubstr("AAFInfo.xml:3:1: a picture of 720x486"), inLineTwo)));
     EXPECT_THAT(Check(Record(Sized("720", "486")) + Record(Sized("720", "480"))), IsEmpty());
-    // Fields pass for frames and the reverse.
+    // Fields pass for frames and the reverse, so no order helps.
     EXPECT_THAT(Check(Record(Sized("1920", "1080")) + Record(Sized("1920", "540"))),
-                Contains(AllOf(HasSubstr("1920x540"), inLineTwo)));
+                ElementsAre(AllOf(HasSubstr("1920x540"), inLineTwo, HasSubstr("another id"))));
     EXPECT_THAT(Check(Record(Sized("1920", "540")) + Record(Sized("1920", "1080"))),
-                Contains(AllOf(HasSubstr("1920x1080"), inLineTwo)));
+                ElementsAre(AllOf(HasSubstr("1920x1080"), inLineTwo, HasSubstr("another id"))));
     EXPECT_THAT(Check(Record(Sized("1440", "540")) + Record(Sized("1920", "540"))), IsEmpty());
 }
 
@@ -303,6 +473,49 @@ TEST_F(DataChecks, FindCodesThatLeadNowhere) {
                     HasSubstr("FourCharMapper.xml:4:1: code \"dvpp\" leads to no id; give it")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc ", "vcid='10000'") + Row("apch", "")),
                 Contains(HasSubstr("code \"apch\" leads to no id; give the code a second row")));
+}
+
+TEST_F(DataChecks, LeaveTheIdToTheMovieWhereItsRecordIsThere) {
+    const std::string rows = Row("dvc ", "vcid='10000'") + Row("AVxx", "");
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "10900") + Record(Good(), "10900"), rows),
+                IsEmpty());
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "10999") + Record(Good(), "10999"), rows),
+                IsEmpty());
+    EXPECT_THAT(Check(Record(Good()) + Record(Good(), "11000"), rows),
+                Contains(HasSubstr("code \"AVxx\" leads to no id")));
+    EXPECT_THAT(
+        Check(Record(Good()), rows),
+        ElementsAre(HasSubstr("FourCharMapper.xml:3:1: code \"AVxx\" leads to no id; give it "
+                              "a vcid, or AAFInfo.xml a record with an id of those that "
+                              "movies name themselves, 10900 to 10999")));
+    EXPECT_THAT(Check(Record(Good()) + "<MediaDescriptorSignature/>", rows),
+                Not(Contains(HasSubstr("AVxx"))))
+        << "the record that is broken may be the one";
+}
+
+TEST_F(DataChecks, FindRepeatedRowsWithoutAnId) {
+    const std::string records = Record(Good()) + Record(Good(), "10900") + Record(Good(), "10900");
+    const std::string dvc = Row("dvc ", "vcid='10000'");
+    const auto inLineFour = HasSubstr(
+        "FourCharMapper.xml:4:1: this row of \"AVxx\" serves no movie; take it out: one before it "
+        "counts");
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "") + Row("AVxx", "")), ElementsAre(inLineFour));
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "Vendor='appl'") + Row("AVxx", "Vendor='appl'")),
+                ElementsAre(inLineFour));
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "Vendor='appl' vcid='10000'") +
+                                   Row("AVxx", "Vendor='appl'")),
+                ElementsAre(inLineFour));
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "") + Row("AVxx", "Vendor='appl'")), IsEmpty());
+    EXPECT_THAT(Check(records, dvc + Row("AVxx", "") + Row("AVxx", "vcid='10000'")), IsEmpty());
+}
+
+// Two rows are what it takes to have the table asked.
+TEST_F(DataChecks, FindAThirdRowOfACodeOfTheModulesTable) {
+    const std::string two = Row("apch", "") + Row("apch", "");
+    EXPECT_THAT(Check(Record(Good()), two), Not(Contains(HasSubstr("serves no movie"))));
+    EXPECT_THAT(
+        Check(Record(Good()), two + Row("apch", "")),
+        Contains(HasSubstr("FourCharMapper.xml:4:1: this row of \"apch\" serves no movie")));
 }
 
 TEST_F(DataChecks, FindRastersOfTheModulesTableWithoutARecord) {
@@ -330,6 +543,26 @@ TEST_F(DataChecks, FindRowsThatNoMovieGetsItsIdBy) {
         Check(records, Row("v210", "Vendor='FFMP' vcid='10000'") +
                            Row("v210", "Vendor='appl' vcid='10000'") + Row("v210", "vcid='10000'")),
         IsEmpty());
+}
+
+TEST_F(DataChecks, CutLongTextsBetweenCharacters) {
+    std::string longText = "x";
+    for (int i = 0; i < 100; ++i) {
+        longText += "\xC3\xA9";
+    }
+    const Texts texts =
+        Check(Record(With("ColorSiting", longText)) +
+                  Record(With("PictureEssenceCoding", longText), "10001"),
+              Row("dvc ", "vcid='10000' Vendor='" + longText + "'") + Row(longText, "vcid='1'"));
+    ASSERT_GE(texts.size(), 4u);
+    std::string start = "x";
+    for (int i = 0; i < 29; ++i) {
+        start += "\xC3\xA9";
+    }
+    EXPECT_THAT(texts, Contains(HasSubstr("ColorSiting can't be \"" + start + "...\"")));
+    EXPECT_THAT(texts, Contains(HasSubstr("label: \"" + start + "...\"")));
+    EXPECT_THAT(texts, Contains(HasSubstr("of Vendor only \"x\xC3\xA9\" counts")));
+    EXPECT_THAT(texts, Contains(HasSubstr("characters, not \"" + start + "...\"")));
 }
 
 // What is wrong in one file does not make all of the other wrong.
@@ -376,6 +609,22 @@ TEST_F(DataChecks, CountWhatTheyDoNotKeepOfAFileOfMistakes) {
     const CheckedData checked = CheckFiles("<Map>" + rows + "</Map>", "<Infos/>");
     EXPECT_EQ(checked.findings.size(), 1000u);
     EXPECT_GE(checked.counts.findings, 50'000u);
+}
+
+// What is found last, in both files together, may stand first.
+TEST_F(DataChecks, KeepTheFindingsThatStandFirst) {
+    std::string rows = Row("dvcp", "vcid='10001'");
+    for (int i = 0; i < 5000; ++i) {
+        rows += Row("dvc ", "vcid='x'");
+    }
+    const CheckedData checked =
+        CheckFiles("<Map>\n" + rows + "</Map>", "<Infos>\n" + Record(Good()) + "</Infos>");
+    ASSERT_EQ(checked.findings.size(), 1000u);
+    EXPECT_THAT(checked.findings.front().what, HasSubstr("leads to id 10001, which has no record"));
+    for (std::size_t i = 1; i < checked.findings.size(); ++i) {
+        EXPECT_EQ(checked.findings[i].place.line, i + 2);
+    }
+    EXPECT_GE(checked.counts.findings, 5001u);
 }
 
 TEST_F(DataChecks, TakeManyRowsOfOneCodeAndRecordsOfOneId) {

@@ -105,6 +105,37 @@ TEST_F(HostChecks, FindTheRecordsThatTheModuleFinds) {
     EXPECT_GT(found, 1000u);
 }
 
+TEST_F(HostChecks, FindRowsWhereTheModuleFindsThem) {
+    const std::string path =
+        Write("map.xml",
+              "<Map><DV><More><FourCharMapping FourChar='dvc ' vcid='7'/></More></DV>"
+              "<Other/><FourCharMapping FourChar='dvcp' vcid='8'/></Map>");
+    const FourCharDataContainerReader module(host.factory(), NMAString(path.c_str()));
+    data_check::Findings findings;
+    const data_check::MapperRows read = data_check::ReadMapperRows(Load(path), findings);
+    ASSERT_EQ(read.rows.size(), module.AllEntries().size());
+    for (const MapperRow& row : read.rows) {
+        ncfUInt32 id = 0;
+        EXPECT_EQ(module.GetVCIDByFourChar(WordOf(row.code), &id), NCF_OK);
+        EXPECT_EQ(id, row.id);
+    }
+    EXPECT_EQ(findings.count(), 1u) << "the element that holds nothing";
+}
+
+// A value that an attribute of its element replaces is told, and no id is read there.
+TEST_F(HostChecks, TellAttributesThatTheModuleTakesForValues) {
+    const std::string path = Write("map.xml",
+                                   "<Map><FourCharMapping FourChar='dvc '><vcid note='8'>7</vcid>"
+                                   "</FourCharMapping></Map>");
+    const FourCharDataContainerReader module(host.factory(), NMAString(path.c_str()));
+    ncfUInt32 id = 0;
+    EXPECT_EQ(module.GetVCIDByFourChar(WordOf("dvc "), &id), NCF_OK);
+    EXPECT_EQ(id, 8u);
+    data_check::Findings findings;
+    EXPECT_TRUE(data_check::ReadMapperRows(Load(path), findings).rows.empty());
+    EXPECT_EQ(findings.count(), 1u);
+}
+
 // All files of up to three rows of a code, with and without vendors and ids.
 TEST_F(HostChecks, GiveTheIdsThatTheModuleGives) {
     constexpr const char* kVendors[] = {"", "AAAA", "BBBB"};

@@ -53,6 +53,9 @@ public:
     // The thing that this factory makes is another of its kind.
     NCFRESULT CreateInstance(INCFUnknown*, INCFUnknown* outer, const GUID& iid,
                              void** out) override {
+        if (out == nullptr) {
+            return NCF_E_INVALIDARG;
+        }
         *out = nullptr;
         if (outer != nullptr) {
             return NCF_CLASS_E_NOAGGREGATION;
@@ -69,6 +72,7 @@ private:
 
 template <class Definition>
 NCFRESULT CreateDefinition(INCFUnknown* host, const GUID& component, Definition** out) {
+    *out = nullptr;
     void* factory = nullptr;
     NCFRESULT result = host->QueryInterface(IID_INCFComponentFactory, &factory);
     if (result < 0) {
@@ -83,10 +87,23 @@ NCFRESULT CreateDefinition(INCFUnknown* host, const GUID& component, Definition*
     return result;
 }
 
+// Keeps a definition that was filled in; releases another.
+template <class Definition>
+NCFRESULT WholeOrNothing(NCFRESULT result, Definition** out) {
+    if (result < 0) {
+        (*out)->Release();
+        *out = nullptr;
+    }
+    return result;
+}
+
 }  // namespace
 
 NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterPlugin(INCFUnknown* host, INCFPluginDefinition** out) {
     Note('P');
+    if (host == nullptr || out == nullptr) {
+        return NCF_E_POINTER;
+    }
 #ifdef FAULT_plugin_refuses
     return NCF_E_ACCESSDENIED;
 #endif
@@ -94,7 +111,7 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterPlugin(INCFUnknown* host, INCFPluginDefin
     *out = nullptr;
     return NCF_OK;
 #endif
-    const NCFRESULT result = CreateDefinition(host, CompID_PluginDefinition, out);
+    NCFRESULT result = CreateDefinition(host, CompID_PluginDefinition, out);
     if (result < 0) {
         return result;
     }
@@ -103,13 +120,23 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterPlugin(INCFUnknown* host, INCFPluginDefin
 #else
     const ncfUInt32 count = 2;
 #endif
-    (*out)->SetAttribute(kSomeId, kNCFValueTypeText, "a tiny module", 0xFFFFFFFF);
-    return (*out)->Define(kSomeId, 1, 3, "Tiny", kSomeId, "Nobody", count, 1);
+    result = (*out)->SetAttribute(kSomeId, kNCFValueTypeText, "a tiny module", 0xFFFFFFFF);
+    if (result >= 0) {
+        result = (*out)->Define(kSomeId, 1, 3, "Tiny", kSomeId, "Nobody", count, 1);
+    }
+    return WholeOrNothing(result, out);
 }
 
 NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterComponent(INCFUnknown* host, ncfUInt32 index,
                                                  INCFComponentDefinition** out) {
     Note(static_cast<char>('0' + index));
+    if (host == nullptr || out == nullptr) {
+        return NCF_E_POINTER;
+    }
+    *out = nullptr;
+    if (index > 1) {
+        return NCF_E_INVALIDARG;
+    }
 #ifdef FAULT_component_refuses
     if (index == 1) {
         return NCF_E_INVALIDARG;
@@ -123,13 +150,18 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFRegisterComponent(INCFUnknown* host, ncfUInt32 in
     if (result < 0) {
         return result;
     }
-    return index == 0 ? (*out)->Define(kThingComponent, kSomeId, 1, 3, kThingClass, "Thing")
-                      : (*out)->Define(kShyComponent, kSomeId, 1, 1, kShyClass, "Shy");
+    return WholeOrNothing(index == 0
+                              ? (*out)->Define(kThingComponent, kSomeId, 1, 3, kThingClass, "Thing")
+                              : (*out)->Define(kShyComponent, kSomeId, 1, 1, kShyClass, "Shy"),
+                          out);
 }
 
 #ifndef FAULT_no_class_factory
-NCF_PLUGIN_EXPORT NCFRESULT NCFGetClassFactory(INCFUnknown*, const GUID& classId,
+NCF_PLUGIN_EXPORT NCFRESULT NCFGetClassFactory(INCFUnknown* host, const GUID& classId,
                                                const GUID& interfaceId, void** out) {
+    if (host == nullptr || out == nullptr) {
+        return NCF_E_INVALIDARG;
+    }
     *out = nullptr;
     if (!(classId == kThingClass)) {
         return NCF_CLASS_E_CLASSNOTAVAILABLE;
@@ -144,8 +176,11 @@ NCF_PLUGIN_EXPORT NCFRESULT NCFGetClassFactory(INCFUnknown*, const GUID& classId
 }
 #endif
 
-NCF_PLUGIN_EXPORT NCFRESULT NCFCanUnloadNow(INCFUnknown*) {
+NCF_PLUGIN_EXPORT NCFRESULT NCFCanUnloadNow(INCFUnknown* host) {
     Note('U');
+    if (host == nullptr) {
+        return NCF_E_INVALIDARG;
+    }
 #ifdef FAULT_never_unloads
     return NCF_E_FAIL;
 #endif

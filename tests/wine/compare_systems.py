@@ -1,0 +1,212 @@
+#!/usr/bin/python3
+# Copyright (c) 2026 The Cliphost authors
+# SPDX-License-Identifier: MIT
+"""compare_systems.py FOLDER CLIPHOST MOVIES TYPES WORK [MEDIA]
+
+Runs the folder that is made for Windows under Wine, and the program of this system beside it: the same calls
+on the same movies. What they print, their exit status and every file that they write have to be equal. MEDIA
+is a folder of further movies.
+"""
+
+import concurrent.futures
+import os
+import re
+import shutil
+import subprocess
+import sys
+from pathlib import Path
+
+PINNED = ["--pin-time", "2026-01-31T12:00:00Z"]
+# What no two runs have in common.
+PASSING = [
+    (re.compile(r'("made": ?)"[^"]*"'), r"\1"),  # when a report was made
+    (re.compile(r"\b\d+(\.\d+)? s\b"), "some s"),  # how long the checks of a module took
+]
+
+
+class Linux:
+    """The program of this system."""
+
+    def __init__(self, program, work):
+        self.program = [str(program)]
+        self.home = str(program.parent)
+        self.folder = work / "linux"
+        self.environment = dict(os.environ, XDG_CONFIG_HOME="/none", LC_ALL="C.UTF-8")
+
+    def path(self, path):
+        return str(path)
+
+    def run(self, call, folder, seconds=600):
+        done = subprocess.run([*self.program, *call], cwd=folder, env=self.environment, timeout=seconds,
+                              stdin=subprocess.DEVNULL, capture_output=True)
+        return done.returncode, done.stdout, done.stderr
+
+
+class Windows(Linux):
+    """The folder for Windows, copied to where it was not made, under Wine."""
+
+    def __init__(self, laid_out, work):
+        prefix = work / "wine"
+        self.environment = dict(os.environ, WINEPREFIX=str(prefix), WINEDEBUG="-all", WINEARCH="win64",
+                                WINEDLLOVERRIDES="mscoree,mshtml,winemenubuilder.exe=", LC_ALL="C.UTF-8")
+        self.environment.pop("DISPLAY", None)
+        self.wine = shutil.which("wine64") or "/usr/lib/wine/wine64"
+        home = prefix / "drive_c" / "médiâ tools"
+        if not home.parent.is_dir():
+            self.program = [self.wine, "wineboot"]
+            self.run(["--init"], work)
+        shutil.rmtree(home, ignore_errors=True)
+        shutil.copytree(laid_out, home)
+        self.home = r"C:\médiâ tools"
+        self.program = [self.wine, self.home + r"\cliphost.exe"]
+        self.folder = work / "windows"
+
+    def path(self, path):
+        return "Z:" + str(path).replace("/", "\\")
+
+    def stop(self):
+        server = shutil.which("wineserver") or "/usr/lib/wine/wineserver64"
+        subprocess.run([server, "-k"], env=self.environment, check=False)
+
+
+def plain(text, side):
+    """A text of a side with this system's names of the files that it names, and of the program's own folder."""
+    text = text.decode("utf-8", "replace").replace(side.home, "HOME")
+    text = re.sub(r"/?\bZ:(?=[/\\])", "", text)
+    text = re.sub(r"\\\\|\\", "/", text)
+    for pattern, instead in PASSING:
+        text = pattern.sub(instead, text)
+    return text
+
+
+def first_difference(one, other):
+    for mine, yours in zip(one.splitlines() + [""], other.splitlines() + [""]):
+        if mine != yours:
+            at = next((i for i, (a, b) in enumerate(zip(mine, yours)) if a != b), 0)
+            start = max(0, at - 60)
+            return f"\n  Linux:   {mine[start:at + 200]}\n  Windows: {yours[start:at + 200]}"
+    return "\n  one ends before the other"
+
+
+def files_of(folder):
+    return {str(file.relative_to(folder)): file for file in folder.rglob("*") if file.is_file()}
+
+
+class Comparison:
+    def __init__(self, linux, windows, places):
+        self.sides = linux, windows
+        self.places = places
+        self.faults = []
+        self.calls = self.files = 0
+
+    def call(self, name, call):
+        """Runs a call on both sides, each in its own folder of that name."""
+        self.calls += 1
+        answers, folders = [], []
+        for side in self.sides:
+            folder = side.folder / name
+            shutil.rmtree(folder, ignore_errors=True)
+            folder.mkdir(parents=True)
+            given = [self.fill(side, argument) for argument in call]
+            answers.append(side.run(["--no-config", *given], folder))
+            folders.append(files_of(folder))
+        self.compare(name, *answers)
+        self.compare_files(name, *folders)
+        return answers[0]
+
+    def fill(self, side, argument):
+        return re.sub(r"\{(\w+)\}((?:/[^{}=]*)?)",
+                      lambda m: side.path(str(self.places[m[1]]) + m[2]), argument)
+
+    def compare(self, name, linux, windows):
+        if linux[0] != windows[0]:
+            self.faults.append(f"{name}: exit status {linux[0]} on Linux, {windows[0]} on Windows: "
+                               f"{windows[2][-500:]!r}")
+            return
+        for what, *texts in zip(["output", "messages"], linux[1:], windows[1:]):
+            texts = [plain(text, side) for text, side in zip(texts, self.sides)]
+            if texts[0] != texts[1]:
+                self.faults.append(f"{name}: other {what}:" + first_difference(*texts))
+
+    def compare_files(self, name, linux, windows):
+        for file in sorted(linux.keys() ^ windows.keys()):
+            self.faults.append(f"{name}: {file} is written by one system alone")
+        for file in sorted(linux.keys() & windows.keys()):
+            self.files += 1
+            mine, yours = linux[file].read_bytes(), windows[file].read_bytes()
+            if file.endswith((".html", ".csv")):
+                mine, yours = (plain(text, side) for text, side in zip((mine, yours), self.sides))
+            if mine != yours:
+                count = sum(a != b for a, b in zip(mine, yours)) + abs(len(mine) - len(yours))
+                self.faults.append(f"{name}: {file} differs at {count} of {len(mine)} places")
+
+
+def folder_calls(place):
+    """The calls on a whole folder of movies."""
+    every = ["{" + place + "}", "--extensions", ENDINGS]
+    server = "{work}=//server/media"
+    yield "scan", ["scan", "{" + place + "}"]
+    yield "describe", ["describe", *every, "--use-alpha", "--json", "--out-dir", "aaf", "--map", server, *PINNED]
+    yield "bin", ["describe", *every, "-q", "--jobs", "2", "--bin", "bin.aaf", "--stringout", "--map", server,
+                  "--columns-out", "columns.csv", *PINNED]
+    yield "contact", ["contact", *every, "--out-dir", "sheets", "--frames", "4", "--jsonl"]
+
+
+ENDINGS = "mov,mp4,m4v,mpg,mpe,mpeg,m2t,3gp,3g2,qt,moov,movie,avi,txt,mp2,mp3,m4a,wav,aiff,aif,au,aac,mid,mpa," \
+          "gif,jpg,jpeg,jfif,tif,tiff,png,bmp,psd,dv,mxf"
+
+
+def movie_calls(place, movie):
+    """The calls on one movie: its samples, its parameters, a piece of its pictures, all its sound."""
+    name, path = f"{place}/{movie.name}", "{" + place + "}/" + movie.name
+    yield f"{name}/samples", ["samples", path, "--json"]
+    yield f"{name}/params", ["params", path, "--use-alpha", "--json"]
+    yield f"{name}/frames", ["frame", path, "--range", "0:4", "--format", "deepest", "-o", "frames"]
+    yield f"{name}/raw", ["frame", path, "--range", "0:4", "-o", "-"]
+    yield f"{name}/audio", ["audio", path, "-o", "sound.wav"]
+
+
+def calls_of_all(places):
+    """Each list of calls needs what those before it wrote."""
+    movies = [place for place in places if place != "work"]
+    yield [("version", ["--version"]), ("plugin", ["plugin"]), ("types", ["types"]),
+           ("wrong_call", ["describe", "--no-such-option"]), ("no_such_file", ["describe", "{work}/none.mov"]),
+           ("check_data", ["check-data"]), ("validate", ["validate"])]
+    yield [(f"{place}_{name}", call) for place in movies for name, call in folder_calls(place)]
+    for place in movies:
+        bin_file = f"../{place}_bin/bin.aaf"
+        yield [(f"{place}_dump", ["dump", bin_file, "--json"]),
+               (f"{place}_verify", ["verify", bin_file, "--json", "--map", "{work}=//server/media"])]
+    for place in movies:
+        for movie in sorted(places[place].iterdir()):
+            if movie.is_file() and not movie.name.startswith("."):
+                yield list(movie_calls(place, movie))
+
+
+def main(laid_out, program, movies, types, work, media=None):
+    work = Path(work).resolve()
+    work.mkdir(parents=True, exist_ok=True)
+    places = {"work": work}
+    for name, folder in (("movies", movies), ("types", types), ("media", media)):
+        if folder:
+            places[name] = work / name
+            if places[name].is_symlink():
+                places[name].unlink()
+            places[name].symlink_to(Path(folder).resolve())
+    windows = Windows(Path(laid_out).resolve(), work)
+    comparison = Comparison(Linux(Path(program).resolve(), work), windows, places)
+    try:
+        with concurrent.futures.ThreadPoolExecutor(os.cpu_count()) as pool:
+            for calls in calls_of_all(places):
+                list(pool.map(lambda call: comparison.call(*call), calls))
+    finally:
+        windows.stop()
+    for fault in sorted(comparison.faults):
+        print(fault)
+    print(f"{comparison.calls} calls under Wine and on Linux, {comparison.files} files written by both, "
+          f"{len(comparison.faults)} differences")
+    return 1 if comparison.faults else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main(*sys.argv[1:]))
