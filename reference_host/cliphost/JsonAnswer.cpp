@@ -9,6 +9,7 @@
 #include <system_error>
 
 #include "reference_host/cliphost/MachinePath.h"
+#include "reference_host/system/OutputStream.h"
 
 namespace cliphost {
 
@@ -56,7 +57,8 @@ void PrintJsonLine(std::string_view json) {
     }
     fmt::print("{}\n", line);
     if (std::fflush(stdout) != 0) {
-        throw std::system_error(errno, std::generic_category(), "standard output");
+        throw std::system_error(host::system::StandardOutputError(errno), std::generic_category(),
+                                "standard output");
     }
 }
 

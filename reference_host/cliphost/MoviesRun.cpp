@@ -95,8 +95,10 @@ int MoviesRun::Run() {
     }
     // Before a signal takes its effect, which may also have come behind the last movie. Who reads
     // what is printed may go away.
-    if (std::fflush(stdout) != 0 && errno != EPIPE) {
-        throw std::system_error(errno, std::generic_category(), "standard output");
+    if (std::fflush(stdout) != 0) {
+        if (const int error = host::system::StandardOutputError(errno); error != EPIPE) {
+            throw std::system_error(error, std::generic_category(), "standard output");
+        }
     }
     return status_;
 }

@@ -23,6 +23,7 @@
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/quicktime/MovieComponents.h"
 #include "reference_host/system/LibrarySearch.h"
+#include "reference_host/system/OutputStream.h"
 #include "reference_host/system/Process.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -50,7 +51,8 @@ int FlushOutput(int status) {
     if (std::fflush(stdout) == 0 && std::cout.good()) {
         return status;
     }
-    return OutputStatus(errno != 0 ? errno : EIO, status);
+    const int error = host::system::StandardOutputError(errno);
+    return OutputStatus(error != 0 ? error : EIO, status);
 }
 
 std::string CommandLineProblem(const CLI::App* app, const CLI::Error& error) {
@@ -92,6 +94,7 @@ int Run(const std::vector<std::string>& words) {
         "maps and delivers their pictures and sound."};
     app.name("cliphost");
     app.require_subcommand(1);
+    app.allow_windows_style_options(false);  // /a/b is a path everywhere
     app.fallthrough();
     app.set_version_flag("--version", "cliphost " PRODUCT_VERSION_TEXT);
     app.add_flag("-v", session.verbosity,
@@ -159,7 +162,7 @@ int Run(const std::vector<std::string>& words) {
         return kExitCaller;
     } catch (const std::system_error& error) {
         if (std::ferror(stdout) != 0) {
-            return OutputStatus(error.code().value(), status);
+            return OutputStatus(host::system::StandardOutputError(error.code().value()), status);
         }
         Tell(error.what());
         return kExitFile;

@@ -20,6 +20,7 @@
 #include "reference_host/cliphost/Verbs.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/cliphost/WorkerOptions.h"
+#include "reference_host/system/OutputStream.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Printable.h"
 
@@ -188,8 +189,10 @@ void PrintList(const std::vector<const Check*>& checks, bool asJson) {
 
 // Who reads what is printed may go away.
 void FlushAnswer() {
-    if (std::fflush(stdout) != 0 && errno != EPIPE) {
-        throw std::system_error(errno, std::generic_category(), "standard output");
+    if (std::fflush(stdout) != 0) {
+        if (const int error = host::system::StandardOutputError(errno); error != EPIPE) {
+            throw std::system_error(error, std::generic_category(), "standard output");
+        }
     }
 }
 

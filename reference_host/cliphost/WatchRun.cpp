@@ -24,6 +24,7 @@
 #include "reference_host/system/DelayedSignals.h"
 #include "reference_host/system/FileNumber.h"
 #include "reference_host/system/FolderWatch.h"
+#include "reference_host/system/OutputStream.h"
 
 namespace cliphost {
 namespace {
@@ -96,7 +97,7 @@ private:
             error = failed.code().value();
         }
         if (error == 0 && std::fflush(stdout) != 0) {
-            error = errno;
+            error = host::system::StandardOutputError(errno);
         } else if (error == 0 && std::ferror(stdout) != 0) {
             error = EIO;
         }

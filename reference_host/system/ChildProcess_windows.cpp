@@ -64,12 +64,14 @@ HANDLE CallEvent() {
     return event;
 }
 
+}  // namespace
+
 // A read or write that goes on by itself, and its memory.
-class Call {
+class PipeCall {
 public:
-    Call() = default;
-    Call(const Call&) = delete;
-    Call& operator=(const Call&) = delete;
+    PipeCall() = default;
+    PipeCall(const PipeCall&) = delete;
+    PipeCall& operator=(const PipeCall&) = delete;
 
     bool IsUnderWay() const { return isUnderWay_; }
     bool HasEnded() const { return isUnderWay_ && HasOverlappedIoCompleted(&overlapped_); }
@@ -119,12 +121,12 @@ private:
 };
 
 // Our end of a connection.
-struct OwnEnd {
+struct PipeEnd {
     OwnedHandle pipe;
-    Call reading;
-    Call writing;
+    PipeCall reading;
+    PipeCall writing;
 
-    ~OwnEnd() { Close(); }
+    ~PipeEnd() { Close(); }
     void Close() {
         reading.Cancel(pipe.get());
         writing.Cancel(pipe.get());
@@ -178,6 +180,8 @@ struct OwnEnd {
         }
     }
 };
+
+namespace {
 
 // Connects our end with one that a child can inherit. 0, or the system's error.
 DWORD Connect(OwnedHandle& own, OwnedHandle& others, bool isBothWays) {
@@ -254,8 +258,8 @@ HANDLE channelToParent = INVALID_HANDLE_VALUE;
 struct ChildProcess::Ends {
     OwnedHandle process;
     OwnedHandle job;
-    OwnEnd channel;
-    OwnEnd errors;
+    PipeEnd channel;
+    PipeEnd errors;
     bool isClosed = false;  // the channel, by the child
 };
 
@@ -386,7 +390,7 @@ void ChildProcess::WaitForAny(const std::vector<const ChildProcess*>& children,
     ResetEvent(CallEvent());
     for (const ChildProcess* const child : children) {
         Ends& ends = *child->ends_;
-        for (OwnEnd* const end : {&ends.channel, &ends.errors}) {
+        for (PipeEnd* const end : {&ends.channel, &ends.errors}) {
             const bool isRead = end->pipe.IsOpen() && !end->reading.IsUnderWay();
             if ((isRead && !end->reading.StartRead(end->pipe.get())) || end->reading.HasEnded() ||
                 end->writing.HasEnded()) {

@@ -25,6 +25,8 @@ bool IsFolder(const std::filesystem::path& path) {
     return attributes != INVALID_FILE_ATTRIBUTES && (attributes & FILE_ATTRIBUTE_DIRECTORY) != 0;
 }
 
+}  // namespace
+
 // One folder, of which the system notes changes.
 class WatchedFolder {
 public:
@@ -100,8 +102,6 @@ private:
     std::vector<DWORD> bytes_ = std::vector<DWORD>(kBytes / sizeof(DWORD));
     bool isUnderWay_ = false;
 };
-
-}  // namespace
 
 struct FolderWatch::Watched {
     OwnedHandle event{CreateEventW(nullptr, TRUE, FALSE, nullptr)};

@@ -96,8 +96,8 @@ void MakeFoundAs(const std::filesystem::path& file, const char* name) {
         std::filesystem::create_symlink(whole, scratch.path() / name, error);
     }
     if (!error) {
-        StartAnew(scratch.path().string());
-        TakeBack(scratch.path().string(), whole, name);
+        StartAnew(scratch.path().native());
+        TakeBack(scratch.path().native(), whole, name);
     }
 }
 

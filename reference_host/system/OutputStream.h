@@ -12,6 +12,10 @@ namespace host::system {
 std::optional<int> DescriptorOf(const std::filesystem::path& path);
 bool IsStandardOutput(const std::filesystem::path& path);
 
+// Of the error that the C library just gave for standard output: the same, or EPIPE where that is
+// what it means.
+int StandardOutputError(int error);
+
 // Takes bytes to a file, a device or an open descriptor. Failures are the
 // system's error numbers; 0: none.
 class OutputStream {

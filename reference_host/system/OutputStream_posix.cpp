@@ -41,6 +41,10 @@ bool IsStandardOutput(const std::filesystem::path& path) {
     return DescriptorOf(path) == STDOUT_FILENO;
 }
 
+int StandardOutputError(int error) {
+    return error;
+}
+
 int OutputStream::Open(const std::filesystem::path& path) {
     descriptor_ = open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0666);
     return descriptor_ < 0 ? errno : 0;

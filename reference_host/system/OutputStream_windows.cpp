@@ -28,6 +28,11 @@ bool IsStandardOutput(const std::filesystem::path& path) {
     return DescriptorOf(path) == kStandardOutput;
 }
 
+int StandardOutputError(int error) {
+    // The library knows no number for a pipe that nobody reads.
+    return error == EINVAL && _doserrno == ERROR_NO_DATA ? EPIPE : error;
+}
+
 int OutputStream::Open(const std::filesystem::path& path) {
     // Others may remove it, so that a signal can.
     OwnedHandle file(CreateFileW(path.c_str(), GENERIC_WRITE,
