@@ -68,20 +68,25 @@ Failure NoFolder(const std::filesystem::path& parent, const std::error_code& err
             "name another one in TMPDIR"};
 }
 
-// What most likely ends a process so.
+// What most likely ends a process so. Windows counts its ends by these numbers, too, and lacks some
+// names.
 struct CauseOfEnd {
     int signal;
     const char* words;
 };
 constexpr CauseOfEnd kCausesOfEnd[] = {
     {SIGSEGV, "a pointer is used that is null, or that leads to something that is gone"},
+#ifdef SIGBUS
     {SIGBUS, "a pointer is used that leads nowhere, or a mapped file has become shorter"},
+#endif
     {SIGABRT,
      "an exception that nobody catches, an assertion, or memory that was written beyond its end "
      "or freed twice"},
     {SIGFPE, "a whole number is divided by zero"},
     {SIGILL, "an instruction that this processor does not have, or a trap of the compiler's"},
+#ifdef SIGKILL
     {SIGKILL, "the system ended it, for want of memory perhaps"},
+#endif
 };
 
 std::string WhyItEnded(const host::system::ProcessEnd& end) {
