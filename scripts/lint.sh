@@ -22,6 +22,8 @@ rule 'system headers belong in reference_host/system/' \
   '#include <(windows|bcrypt|unistd|fcntl|dlfcn|dirent|pthread|sys/[a-z]+)\.h>' -- reference_host ':!reference_host/system'
 rule 'the text of a path is PathText() or u8string(): elsewhere it is in the code page' \
   '\.(generic_)?string\(\)' -- reference_host aaf_library
+rule "the system's errors have numbers and words of its own: ask for default_error_condition() first" \
+  '\b(error|failure|problem)\.(value|message)\(\)' -- reference_host aaf_library ':!reference_host/system'
 rule 'attributes of compilers belong in host_interfaces/framework/Compiler.h' '__attribute__|__declspec' \
   -- source host_interfaces public_include text aaf_library reference_host \
      ':!host_interfaces/framework/Compiler.h' ':!reference_host/quicktime/pixels'

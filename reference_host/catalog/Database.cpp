@@ -72,7 +72,9 @@ void Database::Closing::operator()(sqlite3* handle) const {
 
 Database::Database(const std::filesystem::path& file, Access access) : file_(file) {
     // A name of another form could mean something else than a file.
-    Open(std::filesystem::absolute(file).u8string().c_str(), FlagsOf(access));
+    const std::filesystem::path whole =
+        file.has_root_directory() ? file : std::filesystem::absolute(file);
+    Open(whole.u8string().c_str(), FlagsOf(access));
     if (access == Access::Read) {
         Run("PRAGMA query_only = ON");
     }

@@ -134,7 +134,7 @@ AafLibrary::AafLibrary(const std::filesystem::path& file) : file_(file) {
             fmt::format(
                 "name a folder that can be written to in TMPDIR, or give the file that name "
                 "and start again with LD_LIBRARY_PATH={}",
-                DisplayPath(std::filesystem::absolute(file).parent_path())));
+                DisplayPath(host::system::WholePath(file).parent_path())));
     }
 }
 

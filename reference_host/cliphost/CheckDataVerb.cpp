@@ -11,6 +11,7 @@
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/data_check/DataCheck.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/Printable.h"
 
 namespace cliphost {
@@ -132,7 +133,7 @@ void AddCheckData(CLI::App& app, const SessionOptions& session, int& status) {
     verb->add_flag("--json", options->json, kJsonHelp);
     verb->callback([&session, &status, options] {
         const std::filesystem::path folder =
-            options->folder.empty() ? std::filesystem::absolute(ModuleFile(session)).parent_path()
+            options->folder.empty() ? host::system::WholePath(ModuleFile(session)).parent_path()
                                     : options->folder;
         AnswerFailureToo(options->json, schema::kCheckData, {{"folder", MachinePath(folder)}}, [&] {
             status = CheckDataFiles(folder, options->json, session.verbosity);

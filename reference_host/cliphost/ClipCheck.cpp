@@ -62,12 +62,14 @@ ClipPlace ClipCheck::PlaceOf(const std::string& url) {
     }
     const std::filesystem::path there = host::system::PathOfPlace(named.machine, named.path);
     // Where paths have no drives, a drive's name may still be a folder's.
-    const bool isDriveElsewhere = !there.has_root_name() && named.IgnoresCase();
-    if (there.empty() || (isDriveElsewhere && !std::filesystem::exists(there, error))) {
+    const bool isDriveElsewhere =
+        named.machine.empty() && !there.has_root_name() && named.IgnoresCase();
+    if (there.empty() || (isDriveElsewhere &&
+                          !std::filesystem::exists(host::system::PathOfText(named.path), error))) {
         place.reason = "this is a place of another machine; say with --map where it is here";
         return place;
     }
-    place.path = there.lexically_normal();
+    place.path = there;
     const auto status = std::filesystem::status(place.path, error);
     if (const Problem problem = WhyUnreadable(place.path)) {
         place.state = status.type() == std::filesystem::file_type::not_found ? ClipState::Missing

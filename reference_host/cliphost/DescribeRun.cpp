@@ -77,7 +77,7 @@ void DescribeRun::RefuseOutputsOntoOthers() const {
     // The names of the outputs are found one after the other.
     if (!table.empty() && !movies.outFolder.empty() &&
         InSmallLetters(host::system::PathText(table.extension())) == kEndingOfOutputs &&
-        IsPlaceOf(std::filesystem::absolute(table).parent_path(), movies.outFolder)) {
+        IsPlaceOf(host::system::WholePath(table).parent_path(), movies.outFolder)) {
         throw Failure(kExitCaller, table, "a movie's output may have this name",
                       "give the table another ending or folder");
     }

@@ -34,13 +34,9 @@ int ReachError(const std::filesystem::path& path) {
 
 // The first part of the way, from the root on, that can't be reached.
 std::filesystem::path FirstOutOfReach(const std::filesystem::path& path) {
-    // A drive or server is none by itself.
-    std::filesystem::path part = path.root_path();
-    for (const std::filesystem::path& name : path.relative_path()) {
-        part /= name;
-        if (ReachError(part) != 0) {
-            break;
-        }
+    std::filesystem::path part = path;
+    while (part.has_relative_path() && ReachError(part.parent_path()) != 0) {
+        part = part.parent_path();
     }
     return part;
 }

@@ -12,6 +12,7 @@
 #include "reference_host/cliphost/Notice.h"
 #include "reference_host/cliphost/PrivateFile.h"
 #include "reference_host/system/DelayedSignals.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
 
 namespace cliphost {
@@ -135,7 +136,7 @@ std::filesystem::path RunInPieces::FolderNearOutput() const {
     if (OutputFile::IsDevice(output)) {
         return host::system::TemporaryFolder();
     }
-    const std::filesystem::path place = std::filesystem::absolute(output, ignored);
+    const std::filesystem::path place = host::system::WholePath(output);
     return std::filesystem::is_directory(place, ignored) ? place : place.parent_path();
 }
 

@@ -18,20 +18,7 @@ std::string MachinePath(const std::filesystem::path& path) {
 }
 
 std::filesystem::path AbsolutePath(const std::filesystem::path& path) {
-    std::error_code error;
-    const std::filesystem::path absolute = std::filesystem::absolute(path, error);
-    std::filesystem::path way;
-    for (const std::filesystem::path& name : error ? path : absolute) {
-        if (name == ".." && std::filesystem::is_symlink(way, error)) {
-            const std::filesystem::path target = std::filesystem::canonical(way, error);
-            way = error ? way / name : target.parent_path();
-        } else if (name == ".." && way.filename() != "..") {
-            way = way.parent_path();
-        } else if (name != ".") {
-            way /= name;
-        }
-    }
-    return way;
+    return host::system::AbsolutePath(path);
 }
 
 std::string AbsoluteMachinePath(const std::filesystem::path& path) {

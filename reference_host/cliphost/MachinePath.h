@@ -12,8 +12,7 @@ namespace cliphost {
 // both forms.
 std::string MachinePath(const std::filesystem::path& path);
 
-// An absolute path without "." and "..". Behind a link, ".." leads out of the folder that the link
-// leads to; it stays where the link leads nowhere.
+// As the system has it.
 std::filesystem::path AbsolutePath(const std::filesystem::path& path);
 
 // The machine path of the absolute path: equal for all runs, wherever they are started.

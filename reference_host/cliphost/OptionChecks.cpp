@@ -129,7 +129,7 @@ void RefuseOutputOntoMovie(const std::filesystem::path& output,
 bool IsPlaceOf(const std::filesystem::path& output, const std::filesystem::path& file) {
     std::error_code error;
     const auto whole = [&](const std::filesystem::path& path) {
-        return std::filesystem::weakly_canonical(std::filesystem::absolute(path, error), error);
+        return std::filesystem::weakly_canonical(host::system::WholePath(path), error);
     };
     const std::filesystem::path place = whole(output);
     return (!error && place == whole(file)) || std::filesystem::equivalent(output, file, error);

@@ -43,7 +43,7 @@ ReportFolder::ReportFolder(std::filesystem::path folder)
     std::error_code error;
     aside_.emplace(folder_, error);
     if (error) {
-        throw Failure(kExitCaller, FolderNotMade(folder_, error.value()));
+        throw Failure(kExitCaller, FolderNotMade(folder_, error.default_error_condition().value()));
     }
 }
 
@@ -62,7 +62,8 @@ void ReportFolder::PutIntoPlace() {
         std::error_code error;
         std::filesystem::rename(aside_->path() / name, folder_ / name, error);
         if (error) {
-            throw Failure(kExitCaller, NotWritten(folder_ / name, error.value()));
+            throw Failure(kExitCaller,
+                          NotWritten(folder_ / name, error.default_error_condition().value()));
         }
     }
 }

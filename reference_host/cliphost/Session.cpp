@@ -121,9 +121,8 @@ Session::Session(const SessionOptions& options)
     RegisterServices(*host_);
 
     const std::filesystem::path module = ModuleFile(options);
-    std::error_code ignored;
     // The module looks for its data files by the path that it was loaded from.
-    if (host::system::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
+    if (host::system::HoldsBackslash(host::system::WholePath(module))) {
         throw Failure(kExitCaller, BackslashProblem(module));
     }
     host::LoadFailure failure;

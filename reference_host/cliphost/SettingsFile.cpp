@@ -270,10 +270,16 @@ std::filesystem::path DefaultSettingsFile() {
 }
 
 void AddSettingsFile(CLI::App& app) {
-    app.set_config(
-        "--config", host::system::PathText(DefaultSettingsFile()),
-        "Read options from this file instead of ~/.config/cliphost.toml; those of the command line "
-        "win over it");
+    const CLI::Validator toOpen(
+        [](std::string& text) {
+            text = host::system::NameForLibraries(host::system::PathOfText(text));
+            return std::string();
+        },
+        "", "NameForLibraries");
+    app.set_config("--config", host::system::PathText(DefaultSettingsFile()),
+                   "Read options from this file instead of ~/.config/cliphost.toml; those of the "
+                   "command line win over it")
+        ->transform(toOpen);
     app.add_flag(kNoSettingsFile, "Read no such file")->configurable(false);
     app.config_formatter(std::make_shared<SettingsReader>(app));
 }

@@ -204,8 +204,7 @@ void RefuseModulePath(const std::filesystem::path& module) {
     if (Problem problem = WhyUnreadable(module); problem && StatusOf(problem) == kExitCaller) {
         throw Failure(kExitCaller, std::move(problem));
     }
-    std::error_code ignored;
-    if (host::system::HoldsBackslash(std::filesystem::absolute(module, ignored))) {
+    if (host::system::HoldsBackslash(host::system::WholePath(module))) {
         throw Failure(kExitCaller, BackslashProblem(module));
     }
 }

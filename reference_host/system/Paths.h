@@ -31,6 +31,16 @@ std::filesystem::path PathOfText(std::string_view text);
 // The same text with "/" between the names.
 std::string GenericPathText(const std::filesystem::path& path);
 
+// A text by which a library finds a file that is there, though it takes names in the C library's
+// encoding alone. Where the system has none, the path's own.
+std::string NameForLibraries(const std::filesystem::path& path);
+
+// The path from the root on, otherwise as it is.
+std::filesystem::path WholePath(const std::filesystem::path& path);
+// An absolute path without "." and "..". Behind a link, ".." leads out of the folder that the link
+// leads to; it stays where the link leads nowhere.
+std::filesystem::path AbsolutePath(const std::filesystem::path& path);
+
 // The file URL of an absolute path, and the text of the path that a URL names on this machine.
 // False, with `path` unchanged, for one that names none.
 std::string UrlOfPath(const std::filesystem::path& path);

@@ -30,6 +30,32 @@ std::filesystem::path PathOfText(std::string_view text) {
     return text;
 }
 
+std::string NameForLibraries(const std::filesystem::path& path) {
+    return PathText(path);
+}
+
+std::filesystem::path WholePath(const std::filesystem::path& path) {
+    std::error_code error;
+    const std::filesystem::path whole = std::filesystem::absolute(path, error);
+    return error ? path : whole;
+}
+
+std::filesystem::path AbsolutePath(const std::filesystem::path& path) {
+    std::error_code error;
+    std::filesystem::path way;
+    for (const std::filesystem::path& name : WholePath(path)) {
+        if (name == ".." && std::filesystem::is_symlink(way, error)) {
+            const std::filesystem::path target = std::filesystem::canonical(way, error);
+            way = error ? way / name : target.parent_path();
+        } else if (name == ".." && way.filename() != "..") {
+            way = way.parent_path();
+        } else if (name != ".") {
+            way /= name;
+        }
+    }
+    return way;
+}
+
 std::string UrlOfPath(const std::filesystem::path& path) {
     return text::FileUrl(path.native());
 }
@@ -39,7 +65,8 @@ bool PathTextOfUrl(std::string_view url, std::string& path) {
 }
 
 std::filesystem::path PathOfPlace(const std::string& machine, const std::string& path) {
-    return machine.empty() ? std::filesystem::path(path) : std::filesystem::path();
+    return machine.empty() ? std::filesystem::path(path).lexically_normal()
+                           : std::filesystem::path();
 }
 
 std::string NameProblem(const std::filesystem::path&) {

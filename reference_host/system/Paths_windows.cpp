@@ -1,6 +1,10 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/Paths.h"
+
+#include <algorithm>
+
+#include "reference_host/system/WindowsCalls.h"
 #include "reference_host/util/text/WindowsPath.h"
 #include "text/Encodings.h"
 
@@ -31,6 +35,35 @@ std::filesystem::path PathOfText(std::string_view text) {
     return encodings::ToWideLossy(plain);
 }
 
+// Most disks have a second, short name for each file, out of ASCII.
+std::string NameForLibraries(const std::filesystem::path& path) {
+    const auto isPlain = [](const std::wstring& name) {
+        return std::all_of(name.begin(), name.end(), [](wchar_t c) { return c < 0x80; });
+    };
+    if (isPlain(path.native())) {
+        return PathText(path);
+    }
+    const std::wstring brief = TextOf(
+        [&](wchar_t* text, DWORD size) { return GetShortPathNameW(path.c_str(), text, size); });
+    return PathText(brief.empty() || !isPlain(brief) ? path : std::filesystem::path(brief));
+}
+
+// The standard library's own takes a share for a folder of the drive. Here ".." goes back by
+// name, whatever lies there.
+std::filesystem::path AbsolutePath(const std::filesystem::path& path) {
+    if (path.empty()) {
+        return path;
+    }
+    const std::wstring whole = TextOf([&](wchar_t* text, DWORD size) {
+        return GetFullPathNameW(path.c_str(), size, text, nullptr);
+    });
+    return whole.empty() ? path : std::filesystem::path(whole);
+}
+
+std::filesystem::path WholePath(const std::filesystem::path& path) {
+    return AbsolutePath(path);
+}
+
 std::string UrlOfPath(const std::filesystem::path& path) {
     return text::UrlOfWindowsPath(PathText(path));
 }
@@ -41,7 +74,7 @@ bool PathTextOfUrl(std::string_view url, std::string& path) {
 
 std::filesystem::path PathOfPlace(const std::string& machine, const std::string& path) {
     std::string here;
-    return text::WindowsPathOfPlace(machine, path, here) ? PathOfText(here)
+    return text::WindowsPathOfPlace(machine, path, here) ? AbsolutePath(PathOfText(here))
                                                          : std::filesystem::path();
 }
 

@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
 
 #include <fmt/format.h>
@@ -25,10 +26,7 @@ ScratchFolder::ScratchFolder(const std::filesystem::path& parent, std::error_cod
     std::random_device random;
     for (int i = 0; i < kMostTries; ++i) {
         const std::filesystem::path path =
-            std::filesystem::absolute(parent / fmt::format("cliphost-{:08x}", random()), error);
-        if (error) {
-            return;
-        }
+            AbsolutePath(parent / fmt::format("cliphost-{:08x}", random()));
         if (CreateDirectoryW(path.c_str(), nullptr)) {
             path_ = path;
             return;

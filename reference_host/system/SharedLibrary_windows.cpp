@@ -1,5 +1,6 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/SharedLibrary.h"
 
 #include "reference_host/system/WindowsCalls.h"
@@ -38,8 +39,7 @@ SharedLibrary::~SharedLibrary() {
 
 bool SharedLibrary::Open(const std::filesystem::path& file, std::string& reason) {
     Close();
-    std::error_code failure;
-    const std::filesystem::path whole = std::filesystem::absolute(file, failure);
+    const std::filesystem::path whole = AbsolutePath(file);
     // What it needs lies beside it, beside the program or with the system.
     handle_ = LoadLibraryExW(whole.c_str(), nullptr,
                              LOAD_LIBRARY_SEARCH_DLL_LOAD_DIR | LOAD_LIBRARY_SEARCH_DEFAULT_DIRS);

@@ -25,13 +25,11 @@ BOOL WINAPI EndByEvent(DWORD event) {
 }
 
 int Keep(const std::filesystem::path& file) {
-    std::error_code error;
-    const std::filesystem::path absolute = std::filesystem::absolute(file, error);
     const std::lock_guard<std::mutex> held(lock);
     if (nextNumber == 0) {
         SetConsoleCtrlHandler(EndByEvent, TRUE);  // who comes later is asked first
     }
-    names[nextNumber] = error ? file.native() : absolute.native();
+    names[nextNumber] = AbsolutePath(file).native();
     return nextNumber++;
 }
 
