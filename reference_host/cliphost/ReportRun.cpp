@@ -21,6 +21,7 @@
 #include "reference_host/cliphost/ReportShape.h"
 #include "reference_host/cliphost/Words.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/Printable.h"
 
