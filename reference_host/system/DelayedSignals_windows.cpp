@@ -62,11 +62,11 @@ DelayedSignals::~DelayedSignals() {
     if (--objects > 0) {
         return;
     }
+    if (noted != 0) {
+        EndBySignal(noted);  // a handler that still waits would keep the system's list of them
+    }
     SetConsoleCtrlHandler(NoteEvent, FALSE);
     ResetEvent(SignalEvent());
-    if (noted != 0) {
-        EndBySignal(noted);
-    }
 }
 
 int DelayedSignals::Which() {

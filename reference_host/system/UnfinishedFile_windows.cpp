@@ -24,11 +24,11 @@ BOOL WINAPI EndByEvent(DWORD event) {
     return TRUE;
 }
 
+// Before all others: who comes later is asked first, such as who only notes that the run is to end.
+[[maybe_unused]] const BOOL isAsked = SetConsoleCtrlHandler(EndByEvent, TRUE);
+
 int Keep(const std::filesystem::path& file) {
     const std::lock_guard<std::mutex> held(lock);
-    if (nextNumber == 0) {
-        SetConsoleCtrlHandler(EndByEvent, TRUE);  // who comes later is asked first
-    }
     names[nextNumber] = AbsolutePath(file).native();
     return nextNumber++;
 }
@@ -43,9 +43,10 @@ std::filesystem::path BehindLinks(const std::filesystem::path& path) {
     if (!target.IsOpen()) {
         return path;
     }
-    return TextOf([&](wchar_t* text, DWORD size) {
+    const std::wstring whole = TextOf([&](wchar_t* text, DWORD size) {
         return GetFinalPathNameByHandleW(target.get(), text, size, FILE_NAME_NORMALIZED);
     });
+    return whole.empty() ? path : std::filesystem::path(whole);  // disks without a letter tell none
 }
 
 // The place's own name shows whose part it is. One that leaves no room for more is told by a
@@ -60,7 +61,7 @@ std::filesystem::path NameBeside(const std::filesystem::path& place) {
     return place.parent_path() / (stem + L"." + std::to_wstring(GetCurrentProcessId()) + L".part");
 }
 
-// False where something is in the place already.
+// False, without an error, where something is in a place that is not to be taken from it.
 bool Move(const std::filesystem::path& from, const std::filesystem::path& to, DWORD flags,
           std::error_code& error) {
     error.clear();
@@ -68,7 +69,8 @@ bool Move(const std::filesystem::path& from, const std::filesystem::path& to, DW
         return true;
     }
     const DWORD reason = GetLastError();
-    if (reason == ERROR_ALREADY_EXISTS || reason == ERROR_FILE_EXISTS) {
+    const bool isTaken = reason == ERROR_ALREADY_EXISTS || reason == ERROR_FILE_EXISTS;
+    if (isTaken && (flags & MOVEFILE_REPLACE_EXISTING) == 0) {
         return false;
     }
     error.assign(ErrorNumber(reason), std::generic_category());

@@ -80,6 +80,10 @@ def plain(text, side):
     return text
 
 
+# Equal failures would be no difference.
+HAS_TO_SUCCEED = {"version", "plugin", "types", "check_data", "validate"}
+
+
 def first_difference(one, other):
     for mine, yours in zip(one.splitlines() + [""], other.splitlines() + [""]):
         if mine != yours:
@@ -99,6 +103,7 @@ class Comparison:
         self.places = places
         self.faults = []
         self.calls = self.files = 0
+        self.kinds = set()
 
     def call(self, name, call):
         """Runs a call on both sides, each in its own folder of that name."""
@@ -111,7 +116,7 @@ class Comparison:
             given = [self.fill(side, argument) for argument in call]
             answers.append(side.run(["--no-config", *given], folder))
             folders.append(files_of(folder))
-        self.compare(name, *answers)
+        self.compare(name, call, *answers)
         self.compare_files(name, *folders)
         return answers[0]
 
@@ -119,11 +124,17 @@ class Comparison:
         return re.sub(r"\{(\w+)\}((?:/[^{}=]*)?)",
                       lambda m: side.path(str(self.places[m[1]]) + m[2]), argument)
 
-    def compare(self, name, linux, windows):
+    def compare(self, name, call, linux, windows):
+        if name in HAS_TO_SUCCEED and linux[0] != 0:
+            self.faults.append(f"{name}: exit status {linux[0]} on Linux: {linux[2][-500:]!r}")
         if linux[0] != windows[0]:
             self.faults.append(f"{name}: exit status {linux[0]} on Linux, {windows[0]} on Windows: "
                                f"{windows[2][-500:]!r}")
             return
+        if call[-2:] == ["-o", "-"]:
+            if linux[1] != windows[1]:
+                self.faults.append(f"{name}: other bytes: {len(linux[1])} on Linux, {len(windows[1])} on Windows")
+            linux, windows = (0, b"", linux[2]), (0, b"", windows[2])
         for what, *texts in zip(["output", "messages"], linux[1:], windows[1:]):
             texts = [plain(text, side) for text, side in zip(texts, self.sides)]
             if texts[0] != texts[1]:
@@ -134,6 +145,7 @@ class Comparison:
             self.faults.append(f"{name}: {file} is written by one system alone")
         for file in sorted(linux.keys() & windows.keys()):
             self.files += 1
+            self.kinds.add(Path(file).suffix)
             mine, yours = linux[file].read_bytes(), windows[file].read_bytes()
             if file.endswith((".html", ".csv")):
                 mine, yours = (plain(text, side) for text, side in zip((mine, yours), self.sides))
@@ -202,6 +214,8 @@ def main(laid_out, program, movies, types, work, media=None):
                 list(pool.map(lambda call: comparison.call(*call), calls))
     finally:
         windows.stop()
+    for kind in sorted({".aaf", ".png", ".wav"} - comparison.kinds):
+        comparison.faults.append(f"no {kind} file was compared")
     for fault in sorted(comparison.faults):
         print(fault)
     print(f"{comparison.calls} calls under Wine and on Linux, {comparison.files} files written by both, "
