@@ -200,6 +200,18 @@ class ReportInBrowser(unittest.TestCase):
         self.assertEqual(len(self.page.all(".wave path.peak")), 1)
         self.assertEqual(self.page.complaints(), [])
 
+    def test_calls_sound_silent_where_all_of_it_was_read(self):
+        base = {"track": 1, "seconds": 1, "peaks": [0, 0], "means": [0, 0]}
+        waves = [dict(base, isWhole=whole, lacksSamples=lacks) for whole in (True, False) for lacks in (False, True)]
+        page = pages.with_details(self.report, 0, {"waves": waves}, self.report.with_name("silent.html"))
+        self.page.open(page, "#/clip/1")
+        for selector, text in ((".wave figcaption .fine", lambda one: one.text),
+                               (".wave svg", lambda one: one.get_attribute("aria-label"))):
+            told = [text(one) for one in self.page.all(selector)]
+            self.assertEqual(["silent" in one for one in told], [True, False, False, False], told)
+            self.assertEqual(["nothing heard in what was read" in one for one in told],
+                             [False, True, True, True], told)
+
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys
         self.open()
