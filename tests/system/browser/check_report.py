@@ -180,6 +180,18 @@ class ReportInBrowser(unittest.TestCase):
         self.page.click(".mob summary", "Descriptor")
         self.assertIn("CDCIDescriptor", " ".join(self.page.texts(".node summary")))
 
+    def test_shows_mobs_beyond_those_of_a_movie(self):
+        leads = {"class": "SourceClip", "SourceID": "tape", "SourceMobSlotID": "1", "StartTime": "0"}
+        slot = {"class": "TimelineMobSlot", "SlotID": "1", "Segment": [leads]}
+        mobs = [{"class": "MasterMob", "MobID": "a"}, {"class": "SourceMob", "MobID": "b"},
+                {"class": "SourceMob", "MobID": "c", "Slots": [slot]},
+                {"class": "ImportMob", "MobID": "tape", "Slots": [{"class": "TimelineMobSlot", "SlotID": "1"}]}]
+        page = pages.with_details(self.report, 0, {"description": {"Mobs": mobs}}, self.report.with_name("mobs.html"))
+        self.page.open(page, "#/clip/1")
+        self.assertEqual(self.page.complaints(), [])
+        self.assertEqual(self.page.texts(".mob > h3"), ["Master mob", "File mob", "Source mob", "ImportMob"])
+        self.assertIn("importmob, slot 1", self.page.all(".mob")[2].text)
+
     def test_tells_why_a_clip_failed(self):
         self.open()
         self.page.click(NAMES, "none")
