@@ -25,12 +25,16 @@ std::string TextOf(const Json& clip, const char* member) {
 // Text that tells what a clip has; empty for one that does not count.
 using Label = std::string (*)(const Json& clip);
 
+bool HasPictures(const Json& clip) {
+    return clip.contains("width");
+}
+// Of sound alone a clip's rate is that of the edit units in which its length is told.
 std::string RateOf(const Json& clip) {
-    return TextOf(clip, "rate");
+    return HasPictures(clip) ? TextOf(clip, "rate") : std::string();
 }
 // Sound has no colours.
 std::string ColorsOf(const Json& clip) {
-    return !clip.contains("width")   ? std::string()
+    return !HasPictures(clip)        ? std::string()
            : clip.contains("colors") ? TextOf(clip, "colors")
                                      : "not told";
 }

@@ -18,7 +18,7 @@ const TRAIT_NAMES = {
 // Of each kind one chip has to fit, where some are pressed.
 const CHIP_KINDS = [
   {title: 'Codec', of: (clip) => [codecText(clip) || (clip.channels ? 'Sound alone' : '')]},
-  {title: 'Rate', of: (clip) => [clip.rate ? rateText(clip.rate) + '\u00a0fps' : '']},
+  {title: 'Rate', of: (clip) => [framesText(clip)]},
   {title: 'Worth a look',
    of: (clip) => [clip.failed ? 'Not described' : clip.warnings.length ? 'Warnings' : '',
                   ...clip.traits.map((trait) => TRAIT_NAMES[trait.id] || trait.id)]},
@@ -30,7 +30,7 @@ const GROUPINGS = [
   {id: 'none', title: 'Nothing'},
   {id: 'folder', title: 'Folder', of: (clip) => clip.folder},
   {id: 'codec', title: 'Codec', of: (clip) => codecText(clip) || 'No picture'},
-  {id: 'rate', title: 'Rate', of: (clip) => clip.rate ? rateText(clip.rate) + '\u00a0fps' : 'No rate'},
+  {id: 'rate', title: 'Rate', of: (clip) => framesText(clip) || 'No rate'},
 ];
 
 // Orders of clips, rising with a sign of 1 and falling with -1. Those without a value come last in both.
@@ -55,8 +55,8 @@ const COLUMNS = [
   {id: 'length', title: 'Length', number: true, order: byNumber((clip) => clip.seconds),
    text: (clip) => durationText(clip.seconds)},
   {id: 'start', title: 'Timecode', order: byText(startText), text: startText},
-  {id: 'rate', title: 'Rate', number: true, order: byNumber((clip) => ratio(clip.rate) || undefined),
-   text: (clip) => rateText(clip.rate)},
+  {id: 'rate', title: 'Rate', number: true, order: byNumber((clip) => ratio(pictureRate(clip)) || undefined),
+   text: (clip) => rateText(pictureRate(clip))},
   {id: 'raster', title: 'Raster', number: true,
    order: byNumber((clip) => clip.width ? clip.width * clip.height : undefined), text: rasterText},
   {id: 'codec', title: 'Codec', order: byText(codecText), text: codecText},

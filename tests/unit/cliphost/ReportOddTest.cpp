@@ -45,9 +45,15 @@ TEST(OddThingsOfClips, AreNoneWhereAllAreAlike) {
 }
 
 TEST(OddThingsOfClips, TellMixedRatesWithTheClipsOfEach) {
-    EXPECT_EQ(Told({Clip({{"rate", "24/1"}}), Clip({{"rate", "25/1"}}), Clip({{"rate", "24/1"}}),
-                    Clip({{"name", "without"}})}),
+    const auto clip = [](const char* rate) { return Clip({{"rate", rate}, {"width", 16}}); };
+    EXPECT_EQ(Told({clip("24/1"), clip("25/1"), clip("24/1"), Clip({{"name", "without"}})}),
               "rates: 24/1 0 2, 25/1 1");
+}
+
+TEST(OddThingsOfClips, TellNoRateOfSoundAlone) {
+    EXPECT_EQ(Told({Clip({{"rate", "24/1"}, {"width", 16}}),
+                    Clip({{"rate", "25/1"}, {"channels", 2}})}),
+              "");
 }
 
 TEST(OddThingsOfClips, TellMixedColoursOfPicturesAlone) {
