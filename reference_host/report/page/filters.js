@@ -44,9 +44,10 @@ const byNumber = (of) => by(of, (left, right) => left - right);
 const words = new Intl.Collator('en', {numeric: true, sensitivity: 'base'});
 const byText = (of) => by((clip) => of(clip) || undefined, words.compare);
 
-// The first timecode that the movie itself has.
+// The first timecode that the movie itself has. Where nobody knows whether it has one, its clip counts
+// from zero; of a movie that is gone, the catalog's is told.
 function startText(clip) {
-  return clip.hasTimecode === false ? '' : clip.start || '';
+  return clip.hasTimecode || clip.failed ? clip.start || '' : '';
 }
 
 // A column of the table. Its cells have its id as their class, by which narrow screens leave it out.

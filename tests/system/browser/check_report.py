@@ -224,6 +224,15 @@ class ReportInBrowser(unittest.TestCase):
             self.assertEqual(["nothing heard in what was read" in one for one in told],
                              [False, True, True, True], told)
 
+    def test_shows_timecode_where_the_movie_is_known_to_have_it(self):
+        start = "10:11:12:13"
+        for has, failed, shown in ((True, False, True), (False, False, False), (None, False, False),
+                                   (None, True, True)):
+            members = {"start": start, "hasTimecode": has, "failed": failed}
+            page = pages.with_clip(self.report, 0, members, self.report.with_name("timecode.html"))
+            self.page.open(page)
+            self.assertEqual(start in self.page.texts("td.start"), shown, members)
+
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys
         self.open()

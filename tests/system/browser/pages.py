@@ -32,7 +32,7 @@ def sound(clip):
 COLUMNS = {
     "name": lambda clip: clip["name"],
     "length": lambda clip: clip.get("seconds"),
-    "start": lambda clip: clip.get("start") if clip.get("hasTimecode", True) else None,
+    "start": lambda clip: clip.get("start") if clip.get("hasTimecode") or clip["failed"] else None,
     "rate": ratio,
     "raster": lambda clip: clip["width"] * clip["height"] if "width" in clip else None,
     "codec": lambda clip: clip.get("codecName") or clip.get("codec"),
@@ -104,6 +104,17 @@ def with_details(page, number, members, to):
     start, end = element(text, f"clip-{number}")
     details = dict(json.loads(text[start:end]), **members)
     to.write_text(text[:start] + in_script(details) + text[end:], encoding="utf-8")
+    return to
+
+
+def with_clip(page, number, members, to):
+    """The page, but for what the table shows of a clip; what is None is left out."""
+    text = page.read_text(encoding="utf-8")
+    start, end = element(text, "report")
+    whole = json.loads(text[start:end])
+    changed = dict(whole["clips"][number], **members)
+    whole["clips"][number] = {name: value for name, value in changed.items() if value is not None}
+    to.write_text(text[:start] + in_script(whole) + text[end:], encoding="utf-8")
     return to
 
 
