@@ -233,6 +233,17 @@ class ReportInBrowser(unittest.TestCase):
             self.page.open(page)
             self.assertEqual(start in self.page.texts("td.start"), shown, members)
 
+    def test_tells_that_the_map_of_a_movie_is_not_known(self):
+        text = "Where they lie is not known"
+        bare = pages.with_details(self.report, 0, {"samples": None}, self.report.with_name("unmapped.html"))
+        warning = {"kind": "samples", "reason": "r"}
+        for members, told in (({"route": "library"}, True), ({"route": "header"}, False),
+                              ({"route": "library", "failed": True}, False),
+                              ({"route": "library", "warnings": [warning]}, False)):
+            page = pages.with_clip(bare, 0, members, bare.with_name("route.html"))
+            self.page.open(page, "#/clip/1")
+            self.assertEqual(any(text in part for part in self.page.texts(".part")), told, members)
+
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys
         self.open()
