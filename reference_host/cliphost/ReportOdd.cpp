@@ -32,11 +32,12 @@ bool HasPictures(const Json& clip) {
 std::string RateOf(const Json& clip) {
     return HasPictures(clip) ? TextOf(clip, "rate") : std::string();
 }
-// Sound has no colours.
+// Sound has no colours, and where the header is not understood nobody knows what it tells of them.
 std::string ColorsOf(const Json& clip) {
-    return !HasPictures(clip)        ? std::string()
-           : clip.contains("colors") ? TextOf(clip, "colors")
-                                     : "not told";
+    const bool isHeaderKnown = clip.contains("hasTimecode");
+    return !HasPictures(clip) || !isHeaderKnown ? std::string()
+           : clip.contains("colors")            ? TextOf(clip, "colors")
+                                                : "not told";
 }
 // Addresses are dropped of some 30 frames a second, or of several times as many. A rate is "30/1".
 bool CanDrop(const std::string& rate) {
