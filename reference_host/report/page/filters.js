@@ -15,15 +15,15 @@ const TRAIT_NAMES = {
   notInterleaved: 'Poorly interleaved',
 };
 
-// Of each kind one chip has to fit, where some are pressed.
+// Of each kind one chip has to fit, where some are pressed. `most`: the chips of the kind that are shown;
+// what is worth a look is shown however rare it is.
 const CHIP_KINDS = [
-  {title: 'Codec', of: (clip) => [codecText(clip) || (clip.channels ? 'Sound alone' : '')]},
-  {title: 'Rate', of: (clip) => [framesText(clip)]},
+  {title: 'Codec', most: 8, of: (clip) => [codecText(clip) || (clip.channels ? 'Sound alone' : '')]},
+  {title: 'Rate', most: 8, of: (clip) => [framesText(clip)]},
   {title: 'Worth a look',
    of: (clip) => [clip.failed ? 'Not described' : clip.warnings.length ? 'Warnings' : '',
                   ...clip.traits.map((trait) => TRAIT_NAMES[trait.id] || trait.id)]},
 ];
-const MOST_CHIPS = 8;  // of a kind
 
 // What clips of a group have in common; the groups come in the order of these texts.
 const GROUPINGS = [
@@ -113,7 +113,7 @@ function chips(changed) {
         if (label) counts.set(label, (counts.get(label) || 0) + 1);
       }
     }
-    const most = [...counts].sort((a, b) => b[1] - a[1]).slice(0, MOST_CHIPS);
+    const most = [...counts].sort((a, b) => b[1] - a[1]).slice(0, kind.most);
     if (most.length === 0 || (most.length === 1 && place < 2)) return;
     box.append(el("span", {class: "kind"}, kind.title), ...most.map(([label, count]) => {
       const chip = el('button', {type: 'button', class: 'chip', 'aria-pressed': 'false'}, label,

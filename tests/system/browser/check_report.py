@@ -244,6 +244,20 @@ class ReportInBrowser(unittest.TestCase):
             self.page.open(page, "#/clip/1")
             self.assertEqual(any(text in part for part in self.page.texts(".part")), told, members)
 
+    def test_cuts_chips_of_codecs_and_shows_all_that_is_worth_a_look(self):
+        ids = [f"kind {i}" for i in range(20)]
+        traits = [{"id": one, "words": "w"} for one in ids]
+        clips = pages.document(self.report.read_text(encoding="utf-8"))["clips"]
+        page = self.report.with_name("chips.html")
+        pages.with_clip(self.report, 0, {"traits": traits}, page)
+        for number in range(len(clips)):
+            pages.with_clip(page, number, {"codec": f"c{number}", "codecName": f"codec {number}"}, page)
+        self.page.open(page)
+        self.assertGreater(len(clips), 8)
+        told = self.page.texts(".chip")
+        self.assertEqual(sum(one.startswith("codec ") for one in told), 8, told)
+        self.assertEqual({one[:-1] for one in told if one.startswith("kind ")}, set(ids))
+
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys
         self.open()
