@@ -258,6 +258,16 @@ class ReportInBrowser(unittest.TestCase):
         self.assertEqual(sum(one.startswith("codec ") for one in told), 8, told)
         self.assertEqual({one[:-1] for one in told if one.startswith("kind ")}, set(ids))
 
+    def test_tells_how_many_breaks_are_not_listed(self):
+        broken = {"position": 1, "track": 1, "from": 2, "at": 0, "seconds": 3}
+        for count, told in ((8, False), (1234, True)):
+            samples = {"tracks": [], "interleaving": {"widest": 3, "count": count, "breaks": [broken] * 8}}
+            page = pages.with_details(self.report, 0, {"samples": samples}, self.report.with_name("breaks.html"))
+            self.page.open(page, "#/clip/1")
+            caption = self.page.one(".samples caption, .part caption").text
+            self.assertEqual("The first 8 of 1,234" in caption, told, caption)
+            self.assertEqual("The first" in caption, told, caption)
+
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys
         self.open()
