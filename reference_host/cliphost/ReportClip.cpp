@@ -193,8 +193,23 @@ void AddSounds(Essence& essence, Json& facts, Json& details) {
     details["waves"] = std::move(waves);
 }
 
+// The multimedia library tells places in the file for few containers; that is no fault of a movie.
+Json SamplesIfMapped(const Essence& essence, const Json& facts) {
+    try {
+        return ReadReportSamples(essence);
+    } catch (NCFRESULT result) {
+        if (result != NCF_E_NOTSUPPORTED || facts.value("route", "") != route::kLibrary) {
+            throw;
+        }
+        return {};
+    }
+}
+
 void AddSamples(Essence& essence, Json& facts, Json& details) {
-    Json samples = ReadReportSamples(essence);
+    Json samples = SamplesIfMapped(essence, facts);
+    if (samples.is_null()) {
+        return;
+    }
     const auto apart = samples.find("interleaving");
     if (apart != samples.end() && !(*apart)["breaks"].empty()) {
         AddTrait(trait::kNotInterleaved,

@@ -25,14 +25,19 @@ std::string TextOf(const Json& clip, const char* member) {
 // Text that tells what a clip has; empty for one that does not count.
 using Label = std::string (*)(const Json& clip);
 
-std::string RateOf(const Json& clip) {
-    return TextOf(clip, "rate");
+bool HasPictures(const Json& clip) {
+    return clip.contains("width");
 }
-// Sound has no colours.
+// Of sound alone a clip's rate is that of the edit units in which its length is told.
+std::string RateOf(const Json& clip) {
+    return HasPictures(clip) ? TextOf(clip, "rate") : std::string();
+}
+// Sound has no colours, and where the header is not understood nobody knows what it tells of them.
 std::string ColorsOf(const Json& clip) {
-    return !clip.contains("width")   ? std::string()
-           : clip.contains("colors") ? TextOf(clip, "colors")
-                                     : "not told";
+    const bool isHeaderKnown = clip.contains("hasTimecode");
+    return !HasPictures(clip) || !isHeaderKnown ? std::string()
+           : clip.contains("colors")            ? TextOf(clip, "colors")
+                                                : "not told";
 }
 // Addresses are dropped of some 30 frames a second, or of several times as many. A rate is "30/1".
 bool CanDrop(const std::string& rate) {

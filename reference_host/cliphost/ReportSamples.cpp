@@ -16,8 +16,8 @@ using Json = nlohmann::ordered_json;
 constexpr std::uint64_t kColumnsOfChart = 120;
 constexpr std::uint64_t kMostSamples = 1'000'000;  // that are asked one by one
 constexpr std::uint64_t kStandsAlone = 1024;
-constexpr double kReadAhead = 2.0;  // seconds
-constexpr std::size_t kMostBreaks = 8;
+constexpr double kReadAhead = 2.0;      // seconds
+constexpr std::size_t kMostBreaks = 8;  // that are told one by one
 
 // Lengths of groups of pictures, each from one that stands alone to before the next.
 class PictureGroups {
@@ -135,6 +135,7 @@ Json Interleaving(const std::vector<PlayedRuns>& tracks) {
     }
     double widest = 0;
     bool isApart = false;
+    std::uint64_t count = 0;
     Json breaks = Json::array();
     for (const PlacedRun& run : InFileOrder(tracks)) {
         double gap = 0;
@@ -151,7 +152,11 @@ Json Interleaving(const std::vector<PlayedRuns>& tracks) {
         widest = std::max(widest, gap);
         const bool wasApart = isApart;
         isApart = gap > kReadAhead;
-        if (isApart && !wasApart && breaks.size() < kMostBreaks) {
+        if (!isApart || wasApart) {
+            continue;
+        }
+        ++count;
+        if (breaks.size() < kMostBreaks) {
             breaks.push_back({{"position", run.position},
                               {"track", tracks[run.track].track},
                               {"from", tracks[from].track},
@@ -159,7 +164,7 @@ Json Interleaving(const std::vector<PlayedRuns>& tracks) {
                               {"seconds", ToHundredths(gap)}});
         }
     }
-    return {{"widest", ToHundredths(widest)}, {"breaks", std::move(breaks)}};
+    return {{"widest", ToHundredths(widest)}, {"count", count}, {"breaks", std::move(breaks)}};
 }
 
 MediaTime MediaTimeOf(const header_parser::HeaderReport& header, const WhichTrack& which,

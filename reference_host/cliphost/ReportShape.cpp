@@ -46,7 +46,7 @@ constexpr char kShape[] = R"({
             "smallest?": 0, "largest?": 0, "sizes?": [0],
             "groups?": {"count": 0, "shortest": 0, "longest": 0, "mean": 0.5}}],
         "interleaving?": {
-            "widest": 0.5,
+            "widest": 0.5, "count": 0,
             "breaks": [{"position": 0, "track": 0, "from": 0, "at": 0.5, "seconds": 0.5}]}},
     "description?": null
 }})";

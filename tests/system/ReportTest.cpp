@@ -642,4 +642,15 @@ TEST_F(Reports, TellWhichPartOfAMovieCanNotBeRead) {
     EXPECT_NE(clip["warnings"][0]["reason"].get<std::string>().find("xyz1"), std::string::npos);
 }
 
+// The multimedia library reads it, which tells neither timecode, colours nor places in the file.
+TEST_F(Reports, BlameNoMovieForWhatTheLibraryDoesNotTell) {
+    const Json clip = ClipOf(Make(
+        "-i " + Quoted(MadeMovie("h264_with_aac.mov")) + " -map 0:v -map 0:a -c copy", "a.mkv"));
+    EXPECT_EQ(clip["route"], "library");
+    EXPECT_EQ(clip["warnings"].dump(), "[]");
+    EXPECT_FALSE(clip.contains("hasTimecode"));
+    EXPECT_FALSE(clip["details"].contains("samples"));
+    EXPECT_EQ(clip["details"]["waves"].size(), 1u);
+}
+
 }  // namespace

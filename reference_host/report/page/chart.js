@@ -51,7 +51,9 @@ function interleaving(found) {
                 '\u00a0s of playing apart.';
   return [el('h3', {}, 'Interleaving'), el('p', {}, words),
     found.breaks.length === 0 ? '' : el('div', {class: 'wide'}, el('table', {class: 'small'},
-      el('caption', {}, 'Where they are more than 2 seconds apart'),
+      el('caption', {}, 'Where they are more than 2 seconds apart' +
+        (found.count > found.breaks.length ? '. The first ' + found.breaks.length + ' of ' +
+                                             found.count.toLocaleString('en') : '')),
       el('thead', {}, el('tr', {}, ['At byte', 'Track', 'At', 'Apart from', 'By'].map((title) =>
         el('th', {scope: 'col'}, title)))),
       roving(el('tbody', {}, found.breaks.map((one) => el('tr', {},

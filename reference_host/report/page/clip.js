@@ -44,7 +44,8 @@ function summary(clip, details) {
     ['Frames', clip.width ? clip.length : undefined],
     ['Edit units', clip.width ? undefined : clip.length],
     ['First timecode', clip.start],
-    ['Rate', clip.rate],
+    ['Rate', pictureRate(clip)],
+    ['Edit rate', clip.width ? undefined : clip.rate],
     ['Raster', clip.width ? clip.width + 'x' + clip.height : undefined],
     ['Codec', codecText(clip) && clip.codec ? codecText(clip) + ' (' + clip.codec + ')' : codecText(clip)],
     ['Alpha', clip.alpha ? 'yes' : undefined],
@@ -72,6 +73,14 @@ function notDrawn(details) {
   const sounds = details.tracks.filter((track) => track.kind === 'sound').length;
   return sounds <= details.waves.length ? ''
        : el('p', {class: 'fine'}, details.waves.length + ' of ' + sounds + ' sound tracks are drawn.');
+}
+
+function samplesPart(clip, details) {
+  const isUnmapped = clip.route === 'library' && !clip.failed &&
+                     !clip.warnings.some((warning) => warning.kind === 'samples');
+  const content = details.samples ? sampleFacts(details.samples)
+                : isUnmapped ? el('p', {}, 'Where they lie is not known: FFmpeg tells no map of this kind of file.') : '';
+  return content && section('part-samples', 'Samples in the file', content);
 }
 
 // `keys`: where keys lead while the view is shown.
@@ -108,7 +117,7 @@ function clipView(clip, order) {
     details.parameters.length ? section('part-parameters', 'Parameters', facts(details.parameters.map((one) =>
       [one.label || one.name, one.words === one.defaultWords ? one.words : one.words + ' (default: ' + one.defaultWords + ')'])))
       : '',
-    details.samples ? section('part-samples', 'Samples in the file', sampleFacts(details.samples)) : '',
+    samplesPart(clip, details),
     details.description ? section('part-mobs', 'Mobs', mobChain(details.description)) : '');
   const address = (to) => to && '#/clip/' + (to.number + 1);
   const keys = {j: address(order[at + 1]), k: address(order[at - 1]), Escape: '#/'};

@@ -8,7 +8,7 @@ const clips = report.clips;
 clips.forEach((clip, number) => {
   clip.number = number;
   clip.text = folded([clip.name, clip.path, clip.place, clip.codec, clip.codecName, clip.soundCodec,
-                      clip.soundName, rateText(clip.rate), clip.width && clip.width + 'x' + clip.height,
+                      clip.soundName, rateText(pictureRate(clip)), clip.width && clip.width + 'x' + clip.height,
                       clip.start, clip.colors, ...clip.traits.map((trait) => trait.words),
                       ...clip.warnings.map((warning) => warning.reason)].join('\n'));
 });

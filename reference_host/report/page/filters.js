@@ -15,22 +15,22 @@ const TRAIT_NAMES = {
   notInterleaved: 'Poorly interleaved',
 };
 
-// Of each kind one chip has to fit, where some are pressed.
+// Of each kind one chip has to fit, where some are pressed. `most`: the chips of the kind that are shown;
+// what is worth a look is shown however rare it is.
 const CHIP_KINDS = [
-  {title: 'Codec', of: (clip) => [codecText(clip) || (clip.channels ? 'Sound alone' : '')]},
-  {title: 'Rate', of: (clip) => [clip.rate ? rateText(clip.rate) + '\u00a0fps' : '']},
+  {title: 'Codec', most: 8, of: (clip) => [codecText(clip) || (clip.channels ? 'Sound alone' : '')]},
+  {title: 'Rate', most: 8, of: (clip) => [framesText(clip)]},
   {title: 'Worth a look',
    of: (clip) => [clip.failed ? 'Not described' : clip.warnings.length ? 'Warnings' : '',
                   ...clip.traits.map((trait) => TRAIT_NAMES[trait.id] || trait.id)]},
 ];
-const MOST_CHIPS = 8;  // of a kind
 
 // What clips of a group have in common; the groups come in the order of these texts.
 const GROUPINGS = [
   {id: 'none', title: 'Nothing'},
   {id: 'folder', title: 'Folder', of: (clip) => clip.folder},
   {id: 'codec', title: 'Codec', of: (clip) => codecText(clip) || 'No picture'},
-  {id: 'rate', title: 'Rate', of: (clip) => clip.rate ? rateText(clip.rate) + '\u00a0fps' : 'No rate'},
+  {id: 'rate', title: 'Rate', of: (clip) => framesText(clip) || 'No rate'},
 ];
 
 // Orders of clips, rising with a sign of 1 and falling with -1. Those without a value come last in both.
@@ -44,9 +44,10 @@ const byNumber = (of) => by(of, (left, right) => left - right);
 const words = new Intl.Collator('en', {numeric: true, sensitivity: 'base'});
 const byText = (of) => by((clip) => of(clip) || undefined, words.compare);
 
-// The first timecode that the movie itself has.
+// The first timecode that the movie itself has. Where nobody knows whether it has one, its clip counts
+// from zero; of a movie that is gone, the catalog's is told.
 function startText(clip) {
-  return clip.hasTimecode === false ? '' : clip.start || '';
+  return clip.hasTimecode || clip.failed ? clip.start || '' : '';
 }
 
 // A column of the table. Its cells have its id as their class, by which narrow screens leave it out.
@@ -55,8 +56,8 @@ const COLUMNS = [
   {id: 'length', title: 'Length', number: true, order: byNumber((clip) => clip.seconds),
    text: (clip) => durationText(clip.seconds)},
   {id: 'start', title: 'Timecode', order: byText(startText), text: startText},
-  {id: 'rate', title: 'Rate', number: true, order: byNumber((clip) => ratio(clip.rate) || undefined),
-   text: (clip) => rateText(clip.rate)},
+  {id: 'rate', title: 'Rate', number: true, order: byNumber((clip) => ratio(pictureRate(clip)) || undefined),
+   text: (clip) => rateText(pictureRate(clip))},
   {id: 'raster', title: 'Raster', number: true,
    order: byNumber((clip) => clip.width ? clip.width * clip.height : undefined), text: rasterText},
   {id: 'codec', title: 'Codec', order: byText(codecText), text: codecText},
@@ -112,7 +113,7 @@ function chips(changed) {
         if (label) counts.set(label, (counts.get(label) || 0) + 1);
       }
     }
-    const most = [...counts].sort((a, b) => b[1] - a[1]).slice(0, MOST_CHIPS);
+    const most = [...counts].sort((a, b) => b[1] - a[1]).slice(0, kind.most);
     if (most.length === 0 || (most.length === 1 && place < 2)) return;
     box.append(el("span", {class: "kind"}, kind.title), ...most.map(([label, count]) => {
       const chip = el('button', {type: 'button', class: 'chip', 'aria-pressed': 'false'}, label,

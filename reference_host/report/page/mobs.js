@@ -9,6 +9,10 @@ function partsOf(node, member) {
 
 const MOB_TITLES = ['Master mob', 'File mob', 'Source mob'];
 
+function mobTitle(mob, place) {
+  return MOB_TITLES[place] || mob.class || 'Mob';
+}
+
 function plainText(text) {
   return String(text === undefined ? '' : text).replace(/^"|"$/g, '');
 }
@@ -34,7 +38,7 @@ function slotBox(slot, mobs) {
   if (segment.SourceID !== undefined) {
     rows.push(['From', segment.StartTime],
               ['Leads to', target < 0 ? 'nothing further'
-                                      : MOB_TITLES[target].toLowerCase() + ', slot ' + segment.SourceMobSlotID]);
+                                      : mobTitle(mobs[target], target).toLowerCase() + ', slot ' + segment.SourceMobSlotID]);
   }
   return el('li', {class: 'slot', 'data-slot': slot.SlotID,
                    'data-mob': target < 0 ? undefined : target,
@@ -45,8 +49,8 @@ function slotBox(slot, mobs) {
 }
 
 function mobBox(mob, place, mobs) {
-  return el('section', {class: 'mob', 'aria-label': MOB_TITLES[place] || mob.class},
-    el('h3', {}, MOB_TITLES[place] || mob.class),
+  return el('section', {class: 'mob', 'aria-label': mobTitle(mob, place)},
+    el('h3', {}, mobTitle(mob, place)),
     facts([['Name', plainText(mob.Name)], ['Id', mob.MobID]]),
     el('ul', {class: 'slots'}, partsOf(mob, 'Slots').map((slot) => slotBox(slot, mobs))),
     partsOf(mob, 'EssenceDescription').map((descriptor) =>

@@ -20,7 +20,7 @@ function poster(clip) {
 
 function brief(clip) {
   return [codecText(clip) || (clip.channels ? clip.soundName || 'sound' : ''), rasterText(clip),
-          rateText(clip.rate) && rateText(clip.rate) + '\u00a0fps', durationText(clip.seconds)]
+          framesText(clip), durationText(clip.seconds)]
       .filter(Boolean).join(' \u00b7 ');
 }
 

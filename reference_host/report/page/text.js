@@ -32,6 +32,16 @@ function rateText(rate) {
   return rate ? plain(ratio(rate), 3) : '';
 }
 
+// The rate of a clip's pictures. That of sound alone is of edit units, which nobody sees.
+function pictureRate(clip) {
+  return clip.width ? clip.rate : undefined;
+}
+
+function framesText(clip) {
+  const rate = rateText(pictureRate(clip));
+  return rate && rate + '\u00a0fps';
+}
+
 function durationText(seconds) {
   if (seconds === undefined) return '';
   if (seconds < 60) return plain(seconds, seconds < 10 ? 2 : 1) + '\u00a0s';

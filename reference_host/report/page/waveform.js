@@ -13,7 +13,8 @@ function levelPath(levels) {
 }
 
 function waveform(wave, track) {
-  const highest = wave.highest === undefined ? 'silent' : 'highest ' + plain(wave.highest, 1) + '\u00a0dB';
+  const highest = wave.highest !== undefined ? 'highest ' + plain(wave.highest, 1) + '\u00a0dB'
+                : wave.isWhole && !wave.lacksSamples ? 'silent' : 'nothing heard in what was read';
   const title = 'Sound track ' + wave.track +
                 (track ? ', ' + counted(track.channels || 0, 'channel') : '');
   const width = Math.max(1, wave.peaks.length - 1);

@@ -180,6 +180,18 @@ class ReportInBrowser(unittest.TestCase):
         self.page.click(".mob summary", "Descriptor")
         self.assertIn("CDCIDescriptor", " ".join(self.page.texts(".node summary")))
 
+    def test_shows_mobs_beyond_those_of_a_movie(self):
+        leads = {"class": "SourceClip", "SourceID": "tape", "SourceMobSlotID": "1", "StartTime": "0"}
+        slot = {"class": "TimelineMobSlot", "SlotID": "1", "Segment": [leads]}
+        mobs = [{"class": "MasterMob", "MobID": "a"}, {"class": "SourceMob", "MobID": "b"},
+                {"class": "SourceMob", "MobID": "c", "Slots": [slot]},
+                {"class": "ImportMob", "MobID": "tape", "Slots": [{"class": "TimelineMobSlot", "SlotID": "1"}]}]
+        page = pages.with_details(self.report, 0, {"description": {"Mobs": mobs}}, self.report.with_name("mobs.html"))
+        self.page.open(page, "#/clip/1")
+        self.assertEqual(self.page.complaints(), [])
+        self.assertEqual(self.page.texts(".mob > h3"), ["Master mob", "File mob", "Source mob", "ImportMob"])
+        self.assertIn("importmob, slot 1", self.page.all(".mob")[2].text)
+
     def test_tells_why_a_clip_failed(self):
         self.open()
         self.page.click(NAMES, "none")
@@ -199,6 +211,62 @@ class ReportInBrowser(unittest.TestCase):
         self.page.open(page, "#/clip/1")
         self.assertEqual(len(self.page.all(".wave path.peak")), 1)
         self.assertEqual(self.page.complaints(), [])
+
+    def test_calls_sound_silent_where_all_of_it_was_read(self):
+        base = {"track": 1, "seconds": 1, "peaks": [0, 0], "means": [0, 0]}
+        waves = [dict(base, isWhole=whole, lacksSamples=lacks) for whole in (True, False) for lacks in (False, True)]
+        page = pages.with_details(self.report, 0, {"waves": waves}, self.report.with_name("silent.html"))
+        self.page.open(page, "#/clip/1")
+        for selector, text in ((".wave figcaption .fine", lambda one: one.text),
+                               (".wave svg", lambda one: one.get_attribute("aria-label"))):
+            told = [text(one) for one in self.page.all(selector)]
+            self.assertEqual(["silent" in one for one in told], [True, False, False, False], told)
+            self.assertEqual(["nothing heard in what was read" in one for one in told],
+                             [False, True, True, True], told)
+
+    def test_shows_timecode_where_the_movie_is_known_to_have_it(self):
+        start = "10:11:12:13"
+        for has, failed, shown in ((True, False, True), (False, False, False), (None, False, False),
+                                   (None, True, True)):
+            members = {"start": start, "hasTimecode": has, "failed": failed}
+            page = pages.with_clip(self.report, 0, members, self.report.with_name("timecode.html"))
+            self.page.open(page)
+            self.assertEqual(start in self.page.texts("td.start"), shown, members)
+
+    def test_tells_that_the_map_of_a_movie_is_not_known(self):
+        text = "Where they lie is not known"
+        bare = pages.with_details(self.report, 0, {"samples": None}, self.report.with_name("unmapped.html"))
+        warning = {"kind": "samples", "reason": "r"}
+        for members, told in (({"route": "library"}, True), ({"route": "header"}, False),
+                              ({"route": "library", "failed": True}, False),
+                              ({"route": "library", "warnings": [warning]}, False)):
+            page = pages.with_clip(bare, 0, members, bare.with_name("route.html"))
+            self.page.open(page, "#/clip/1")
+            self.assertEqual(any(text in part for part in self.page.texts(".part")), told, members)
+
+    def test_cuts_chips_of_codecs_and_shows_all_that_is_worth_a_look(self):
+        ids = [f"kind {i}" for i in range(20)]
+        traits = [{"id": one, "words": "w"} for one in ids]
+        clips = pages.document(self.report.read_text(encoding="utf-8"))["clips"]
+        page = self.report.with_name("chips.html")
+        pages.with_clip(self.report, 0, {"traits": traits}, page)
+        for number in range(len(clips)):
+            pages.with_clip(page, number, {"codec": f"c{number}", "codecName": f"codec {number}"}, page)
+        self.page.open(page)
+        self.assertGreater(len(clips), 8)
+        told = self.page.texts(".chip")
+        self.assertEqual(sum(one.startswith("codec ") for one in told), 8, told)
+        self.assertEqual({one[:-1] for one in told if one.startswith("kind ")}, set(ids))
+
+    def test_tells_how_many_breaks_are_not_listed(self):
+        broken = {"position": 1, "track": 1, "from": 2, "at": 0, "seconds": 3}
+        for count, told in ((8, False), (1234, True)):
+            samples = {"tracks": [], "interleaving": {"widest": 3, "count": count, "breaks": [broken] * 8}}
+            page = pages.with_details(self.report, 0, {"samples": samples}, self.report.with_name("breaks.html"))
+            self.page.open(page, "#/clip/1")
+            caption = self.page.one(".samples caption, .part caption").text
+            self.assertEqual("The first 8 of 1,234" in caption, told, caption)
+            self.assertEqual("The first" in caption, told, caption)
 
     def test_walks_with_the_keyboard(self):
         keys = browser.Keys

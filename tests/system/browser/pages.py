@@ -15,6 +15,9 @@ END = "</script>\n"
 
 
 def ratio(clip):
+    """Of pictures; nothing for sound alone, whose rate is that of edit units."""
+    if "rate" not in clip or "width" not in clip:
+        return None
     numerator, denominator = clip["rate"].split("/")
     return int(numerator) / int(denominator)
 
@@ -29,8 +32,8 @@ def sound(clip):
 COLUMNS = {
     "name": lambda clip: clip["name"],
     "length": lambda clip: clip.get("seconds"),
-    "start": lambda clip: clip.get("start") if clip.get("hasTimecode", True) else None,
-    "rate": lambda clip: ratio(clip) if "rate" in clip else None,
+    "start": lambda clip: clip.get("start") if clip.get("hasTimecode") or clip["failed"] else None,
+    "rate": ratio,
     "raster": lambda clip: clip["width"] * clip["height"] if "width" in clip else None,
     "codec": lambda clip: clip.get("codecName") or clip.get("codec"),
     "sound": lambda clip: sound(clip) if clip.get("channels") else None,
@@ -43,7 +46,7 @@ COLUMNS = {
 GROUPINGS = {
     "folder": lambda clip: clip["folder"],
     "codec": lambda clip: COLUMNS["codec"](clip) or "No picture",
-    "rate": lambda clip: f"{round(ratio(clip), 3):g}\u00a0fps" if "rate" in clip else "No rate",
+    "rate": lambda clip: f"{round(ratio(clip), 3):g}\u00a0fps" if ratio(clip) else "No rate",
 }
 
 
@@ -101,6 +104,17 @@ def with_details(page, number, members, to):
     start, end = element(text, f"clip-{number}")
     details = dict(json.loads(text[start:end]), **members)
     to.write_text(text[:start] + in_script(details) + text[end:], encoding="utf-8")
+    return to
+
+
+def with_clip(page, number, members, to):
+    """The page, but for what the table shows of a clip; what is None is left out."""
+    text = page.read_text(encoding="utf-8")
+    start, end = element(text, "report")
+    whole = json.loads(text[start:end])
+    changed = dict(whole["clips"][number], **members)
+    whole["clips"][number] = {name: value for name, value in changed.items() if value is not None}
+    to.write_text(text[:start] + in_script(whole) + text[end:], encoding="utf-8")
     return to
 
 

@@ -45,15 +45,28 @@ TEST(OddThingsOfClips, AreNoneWhereAllAreAlike) {
 }
 
 TEST(OddThingsOfClips, TellMixedRatesWithTheClipsOfEach) {
-    EXPECT_EQ(Told({Clip({{"rate", "24/1"}}), Clip({{"rate", "25/1"}}), Clip({{"rate", "24/1"}}),
-                    Clip({{"name", "without"}})}),
+    const auto clip = [](const char* rate) { return Clip({{"rate", rate}, {"width", 16}}); };
+    EXPECT_EQ(Told({clip("24/1"), clip("25/1"), clip("24/1"), Clip({{"name", "without"}})}),
               "rates: 24/1 0 2, 25/1 1");
 }
 
+TEST(OddThingsOfClips, TellNoRateOfSoundAlone) {
+    EXPECT_EQ(
+        Told({Clip({{"rate", "24/1"}, {"width", 16}}), Clip({{"rate", "25/1"}, {"channels", 2}})}),
+        "");
+}
+
 TEST(OddThingsOfClips, TellMixedColoursOfPicturesAlone) {
-    EXPECT_EQ(Told({Clip({{"width", 1}, {"colors", "a"}}), Clip({{"width", 1}}),
-                    Clip({{"channels", 2}})}),
+    EXPECT_EQ(Told({Clip({{"width", 1}, {"hasTimecode", false}, {"colors", "a"}}),
+                    Clip({{"width", 1}, {"hasTimecode", false}}),
+                    Clip({{"channels", 2}, {"hasTimecode", false}})}),
               "colors: a 0, not told 1");
+}
+
+TEST(OddThingsOfClips, TellNoColoursWhereTheHeaderIsNotUnderstood) {
+    EXPECT_EQ(
+        Told({Clip({{"width", 1}, {"hasTimecode", true}, {"colors", "a"}}), Clip({{"width", 1}})}),
+        "");
 }
 
 Json Counting(const char* rate, bool drop, bool hasTimecode = true) {

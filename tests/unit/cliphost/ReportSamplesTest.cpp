@@ -34,6 +34,7 @@ TEST(InterleavingOfSamples, IsGoodWhereTracksTakeTurns) {
 TEST(InterleavingOfSamples, BreaksWhereOneTrackRunsAhead) {
     const auto found = Interleaving(Seconds({0, 1, 0, 0, 0, 1, 1, 1}));
     EXPECT_EQ(found["widest"], 3.0);
+    EXPECT_EQ(found["count"], 1u);
     ASSERT_EQ(found["breaks"].size(), 1u);
     EXPECT_EQ(found["breaks"][0].dump(),
               R"({"position":5100,"track":1,"from":0,"at":1.0,"seconds":3.0})");
@@ -63,12 +64,14 @@ TEST(InterleavingOfSamples, CountsWhenEachTrackIsPlayed) {
     EXPECT_EQ(Interleaving(late)["widest"], 1.0);
 }
 
-TEST(InterleavingOfSamples, TellsTheFirstBreaksAlone) {
+TEST(InterleavingOfSamples, TellsTheFirstBreaksAndTheNumberOfAll) {
     std::vector<ncfUInt32> tracks;
     for (int i = 0; i < 40; ++i) {
         tracks.insert(tracks.end(), {0, 0, 0, 0, 1, 1, 1, 1});
     }
-    EXPECT_EQ(Interleaving(Seconds(tracks))["breaks"].size(), 8u);
+    const auto found = Interleaving(Seconds(tracks));
+    EXPECT_EQ(found["breaks"].size(), 8u);
+    EXPECT_EQ(found["count"], 40u);
 }
 
 }  // namespace

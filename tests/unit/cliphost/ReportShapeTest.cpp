@@ -45,7 +45,7 @@ constexpr char kWhole[] = R"({
                     "faults": ["q"], "smallest": 9, "largest": 11, "sizes": [9, 11],
                     "groups": {"count": 1, "shortest": 3, "longest": 3, "mean": 3.0}}],
         "interleaving": {
-            "widest": 2.5,
+            "widest": 2.5, "count": 1,
             "breaks": [{"position": 8, "track": 0, "from": 1, "at": -0.5, "seconds": 2.5}]}},
     "description": {"class": "Header", "Mobs": [{"class": "MasterMob", "Name": "r"}]}}})";
 
@@ -116,6 +116,7 @@ constexpr Lack kLacks[] = {{"/facts/traits/0", "id"},
                            {"/details/samples/tracks/0/groups", "longest"},
                            {"/details/samples/tracks/0/groups", "mean"},
                            {"/details/samples/interleaving", "widest"},
+                           {"/details/samples/interleaving", "count"},
                            {"/details/samples/interleaving", "breaks"},
                            {"/details/samples/interleaving/breaks/0", "position"},
                            {"/details/samples/interleaving/breaks/0", "track"},
