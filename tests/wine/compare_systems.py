@@ -149,7 +149,8 @@ def folder_calls(place):
     every = ["{" + place + "}", "--extensions", ENDINGS]
     server = "{work}=//server/media"
     yield "scan", ["scan", "{" + place + "}"]
-    yield "describe", ["describe", *every, "--jobs", "1", "--use-alpha", "--json", "--out-dir", "aaf", "--map", server, *PINNED]
+    yield "describe", ["describe", *every, "--jobs", "1", "--use-alpha", "--json", "--out-dir", "aaf",
+                       "--map", server, *PINNED]
     yield "bin", ["describe", *every, "-q", "--jobs", "2", "--bin", "bin.aaf", "--stringout", "--map", server,
                   "--columns-out", "columns.csv", *PINNED]
     yield "contact", ["contact", *every, "--jobs", "1", "--out-dir", "sheets", "--frames", "4", "--jsonl"]
@@ -164,7 +165,7 @@ def movie_calls(place, movie):
     name, path = f"{place}/{movie.name}", "{" + place + "}/" + movie.name
     yield f"{name}/samples", ["samples", path, "--json"]
     yield f"{name}/params", ["params", path, "--use-alpha", "--json"]
-    yield f"{name}/frames", ["frame", path, "--range", "0:4", "--format", "deepest", "-o", "frames"]
+    yield f"{name}/frames", ["frame", path, "--range", "0:4", "--jobs", "1", "--format", "deepest", "-o", "frames"]
     yield f"{name}/raw", ["frame", path, "--range", "0:4", "-o", "-"]
     yield f"{name}/audio", ["audio", path, "-o", "sound.wav"]
 
