@@ -5,29 +5,16 @@
 
 #include <gtest/gtest.h>
 
-#include <nlohmann/json.hpp>
-
 #include "reference_host/cliphost/ReportPictures.h"
 #include "reference_host/cliphost/ReportRun.h"
 #include "reference_host/cliphost/WebpFile.h"
+#include "tests/unit/cliphost/NoisyPicture.h"
 
 using cliphost::AdviceOnSize;
-using cliphost::Picture;
 
 namespace {
 
 constexpr std::uint64_t kMegabyte = 1'000'000;
-
-// Of no order, which takes the most bytes.
-Picture NoisyPicture(int width, int height) {
-    Picture picture{width, height, 3, 8, {}};
-    std::uint32_t number = 1;
-    for (int i = 0; i < width * height * 3; ++i) {
-        number = number * 1664525 + 1013904223;
-        picture.samples.push_back(static_cast<std::uint16_t>(number >> 24));
-    }
-    return picture;
-}
 
 TEST(SizesOfReports, StayBelowTheBoundWithAThousandClips) {
     constexpr std::size_t kRest = 16'000;  // facts, tracks, mobs, and one or two sounds

@@ -7,6 +7,8 @@
 
 #include <cstdlib>
 
+#include "tests/unit/cliphost/NoisyPicture.h"
+
 using cliphost::Picture;
 using cliphost::ToWebp;
 
@@ -22,17 +24,6 @@ Picture TwoColors(int width, int height) {
         picture.samples.insert(picture.samples.end(),
                                {static_cast<std::uint16_t>(isLeft ? 200 : 20), 100,
                                 static_cast<std::uint16_t>(isLeft ? 40 : 220)});
-    }
-    return picture;
-}
-
-// Of no order, so that it takes many bytes.
-Picture Noise(int width, int height) {
-    Picture picture{width, height, 3, 8, {}};
-    std::uint32_t number = 1;
-    for (int i = 0; i < width * height * 3; ++i) {
-        number = number * 1664525 + 1013904223;
-        picture.samples.push_back(static_cast<std::uint16_t>(number >> 24));
     }
     return picture;
 }
@@ -54,7 +45,7 @@ TEST(WebpFiles, ShowThePicture) {
 }
 
 TEST(WebpFiles, KeepToTheBytesThatTheyMayHave) {
-    const Picture noise = Noise(200, 112);
+    const Picture noise = NoisyPicture(200, 112);
     const std::size_t full = ToWebp(noise, kPlenty).size();
     const std::size_t small = ToWebp(noise, full / 2).size();
     EXPECT_GT(small, 0u);
