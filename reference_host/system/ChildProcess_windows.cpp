@@ -96,11 +96,9 @@ public:
         done = {bytes_.data(), size};
         return isFine;
     }
-    // The memory stays the system's until it is told.
-    void Cancel(HANDLE pipe) {
-        DWORD ignored = 0;
-        if (isUnderWay_ && (CancelIoEx(pipe, &overlapped_) || GetLastError() == ERROR_NOT_FOUND)) {
-            GetOverlappedResult(pipe, &overlapped_, &ignored, TRUE);
+    void End(HANDLE pipe) {
+        if (isUnderWay_) {
+            EndCall(pipe, overlapped_);
         }
         isUnderWay_ = false;
     }
@@ -128,8 +126,8 @@ struct PipeEnd {
 
     ~PipeEnd() { Close(); }
     void Close() {
-        reading.Cancel(pipe.get());
-        writing.Cancel(pipe.get());
+        reading.End(pipe.get());
+        writing.End(pipe.get());
         pipe.Close();
     }
 
@@ -386,16 +384,21 @@ ProcessEnd ChildProcess::End() {
 
 void ChildProcess::WaitForAny(const std::vector<const ChildProcess*>& children,
                               std::chrono::milliseconds most) {
-    // Each read is under way; what ends from here on sets the event.
-    ResetEvent(CallEvent());
+    // A read that starts takes the event back, so what has ended is asked behind the last start.
+    std::vector<PipeEnd*> ends;
     for (const ChildProcess* const child : children) {
-        Ends& ends = *child->ends_;
-        for (PipeEnd* const end : {&ends.channel, &ends.errors}) {
-            const bool isRead = end->pipe.IsOpen() && !end->reading.IsUnderWay();
-            if ((isRead && !end->reading.StartRead(end->pipe.get())) || end->reading.HasEnded() ||
-                end->writing.HasEnded()) {
-                return;
-            }
+        ends.insert(ends.end(), {&child->ends_->channel, &child->ends_->errors});
+    }
+    for (PipeEnd* const end : ends) {
+        const bool isRead = end->pipe.IsOpen() && !end->reading.IsUnderWay();
+        if (isRead && !end->reading.StartRead(end->pipe.get())) {
+            return;
+        }
+    }
+    ResetEvent(CallEvent());
+    for (const PipeEnd* const end : ends) {
+        if (end->reading.HasEnded() || end->writing.HasEnded()) {
+            return;
         }
     }
     const HANDLE events[] = {CallEvent(), SignalEvent()};

@@ -34,11 +34,8 @@ public:
         overlapped_.hEvent = event;
     }
     ~WatchedFolder() {
-        DWORD ignored = 0;
         if (isUnderWay_) {
-            // The memory stays the system's until it is told.
-            CancelIoEx(folder_.get(), &overlapped_);
-            GetOverlappedResult(folder_.get(), &overlapped_, &ignored, TRUE);
+            EndCall(folder_.get(), overlapped_);
         }
     }
     WatchedFolder(const WatchedFolder&) = delete;

@@ -48,6 +48,10 @@ std::string ErrorWords(DWORD error);
 // A file or folder that is there, opened beside others who read, write or remove it.
 OwnedHandle OpenThere(const std::filesystem::path& path, DWORD access);
 
+// Ends a call that goes on by itself, if it still does: its memory is the caller's again. The call
+// has an event.
+void EndCall(HANDLE file, OVERLAPPED& call);
+
 // Set from when a signal has come until it is waited for anew.
 HANDLE SignalEvent();
 

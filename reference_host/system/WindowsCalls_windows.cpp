@@ -36,6 +36,14 @@ OwnedHandle OpenThere(const std::filesystem::path& path, DWORD access) {
                                    OPEN_EXISTING, FILE_FLAG_BACKUP_SEMANTICS, nullptr));
 }
 
+void EndCall(HANDLE file, OVERLAPPED& call) {
+    CancelIoEx(file, &call);
+    // The event may be other calls', too, so it doesn't tell that this one has ended.
+    while (!HasOverlappedIoCompleted(&call)) {
+        WaitForSingleObject(call.hEvent, 1);
+    }
+}
+
 HANDLE SignalEvent() {
     static const HANDLE event = CreateEventW(nullptr, TRUE, FALSE, nullptr);
     return event;
