@@ -5,6 +5,7 @@
 #include <fcntl.h>
 #include <io.h>
 
+#include <cstdio>
 #include <cstdlib>
 
 #include "reference_host/system/WindowsCalls.h"
@@ -37,6 +38,8 @@ void PrepareProcess() {
     for (const int stream : {0, 1, 2}) {
         _setmode(stream, _O_BINARY);
     }
+    // Where it is no console, the C library would keep back what is said until there is more of it.
+    std::setvbuf(stderr, nullptr, _IONBF, 0);
     if (IsConsole(STD_OUTPUT_HANDLE) || IsConsole(STD_ERROR_HANDLE)) {
         PrintUtf8();
     }
