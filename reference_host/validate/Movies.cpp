@@ -193,8 +193,10 @@ std::vector<SampleMovie> WriteOddlyNamedMovies(const std::filesystem::path& fold
     };
     std::vector<SampleMovie> written;
     for (const std::string& name : names) {
-        written.push_back(Write(WholeMovie(), folder / host::system::PathOfText(name),
-                                "a sound movie under an odd name"));
+        const std::filesystem::path file = folder / host::system::PathOfText(name);
+        if (host::system::NameProblem(file).empty()) {
+            written.push_back(Write(WholeMovie(), file, "a sound movie under an odd name"));
+        }
     }
     return written;
 }
