@@ -80,6 +80,10 @@ def plain(text, side):
     return text
 
 
+# Equal failures would be no difference.
+HAS_TO_SUCCEED = {"version", "plugin", "types", "check_data", "validate"}
+
+
 def first_difference(one, other):
     for mine, yours in zip(one.splitlines() + [""], other.splitlines() + [""]):
         if mine != yours:
@@ -99,6 +103,7 @@ class Comparison:
         self.places = places
         self.faults = []
         self.calls = self.files = 0
+        self.kinds = set()
 
     def call(self, name, call):
         """Runs a call on both sides, each in its own folder of that name."""
@@ -111,22 +116,27 @@ class Comparison:
             given = [self.fill(side, argument) for argument in call]
             answers.append(side.run(["--no-config", *given], folder))
             folders.append(files_of(folder))
-        self.compare(name, *answers)
+        self.compare(name, call, *answers)
         self.compare_files(name, *folders)
         return answers[0]
 
     def fill(self, side, argument):
+        argument = argument.replace("{module}", side.home + "/plugins/QuickTimePlugin.nvx")
         return re.sub(r"\{(\w+)\}((?:/[^{}=]*)?)",
                       lambda m: side.path(str(self.places[m[1]]) + m[2]), argument)
 
-    def compare(self, name, linux, windows):
+    def compare(self, name, call, linux, windows):
+        if name in HAS_TO_SUCCEED and linux[0] != 0:
+            self.faults.append(f"{name}: exit status {linux[0]} on Linux: {linux[2][-500:]!r}")
         if linux[0] != windows[0]:
             self.faults.append(f"{name}: exit status {linux[0]} on Linux, {windows[0]} on Windows: "
                                f"{windows[2][-500:]!r}")
             return
-        # Under Wine what a child process says on standard error can come too late to be told.
-        told = ["output"] if name.endswith("_bin") else ["output", "messages"]
-        for what, *texts in zip(told, linux[1:], windows[1:]):
+        if call[-2:] == ["-o", "-"]:
+            if linux[1] != windows[1]:
+                self.faults.append(f"{name}: other bytes: {len(linux[1])} on Linux, {len(windows[1])} on Windows")
+            linux, windows = (0, b"", linux[2]), (0, b"", windows[2])
+        for what, *texts in zip(["output", "messages"], linux[1:], windows[1:]):
             texts = [plain(text, side) for text, side in zip(texts, self.sides)]
             if texts[0] != texts[1]:
                 self.faults.append(f"{name}: other {what}:" + first_difference(*texts))
@@ -136,6 +146,7 @@ class Comparison:
             self.faults.append(f"{name}: {file} is written by one system alone")
         for file in sorted(linux.keys() & windows.keys()):
             self.files += 1
+            self.kinds.add(Path(file).suffix)
             mine, yours = linux[file].read_bytes(), windows[file].read_bytes()
             if file.endswith((".html", ".csv")):
                 mine, yours = (plain(text, side) for text, side in zip((mine, yours), self.sides))
@@ -149,11 +160,10 @@ def folder_calls(place):
     every = ["{" + place + "}", "--extensions", ENDINGS]
     server = "{work}=//server/media"
     yield "scan", ["scan", "{" + place + "}"]
-    yield "describe", ["describe", *every, "--jobs", "1", "--use-alpha", "--json", "--out-dir", "aaf",
-                       "--map", server, *PINNED]
+    yield "describe", ["describe", *every, "--use-alpha", "--json", "--out-dir", "aaf", "--map", server, *PINNED]
     yield "bin", ["describe", *every, "-q", "--jobs", "2", "--bin", "bin.aaf", "--stringout", "--map", server,
                   "--columns-out", "columns.csv", *PINNED]
-    yield "contact", ["contact", *every, "--jobs", "1", "--out-dir", "sheets", "--frames", "4", "--jsonl"]
+    yield "contact", ["contact", *every, "--out-dir", "sheets", "--frames", "4", "--jsonl"]
 
 
 ENDINGS = "mov,mp4,m4v,mpg,mpe,mpeg,m2t,3gp,3g2,qt,moov,movie,avi,txt,mp2,mp3,m4a,wav,aiff,aif,au,aac,mid,mpa," \
@@ -165,7 +175,7 @@ def movie_calls(place, movie):
     name, path = f"{place}/{movie.name}", "{" + place + "}/" + movie.name
     yield f"{name}/samples", ["samples", path, "--json"]
     yield f"{name}/params", ["params", path, "--use-alpha", "--json"]
-    yield f"{name}/frames", ["frame", path, "--range", "0:4", "--jobs", "1", "--format", "deepest", "-o", "frames"]
+    yield f"{name}/frames", ["frame", path, "--range", "0:4", "--format", "deepest", "-o", "frames"]
     yield f"{name}/raw", ["frame", path, "--range", "0:4", "-o", "-"]
     yield f"{name}/audio", ["audio", path, "-o", "sound.wav"]
 
@@ -175,7 +185,7 @@ def calls_of_all(places):
     movies = [place for place in places if place != "work"]
     yield [("version", ["--version"]), ("plugin", ["plugin"]), ("types", ["types"]),
            ("wrong_call", ["describe", "--no-such-option"]), ("no_such_file", ["describe", "{work}/none.mov"]),
-           ("check_data", ["check-data"]), ("validate", ["validate"])]
+           ("check_data", ["check-data"]), ("validate", ["validate", "{module}", "--seed", "7"])]
     yield [(f"{place}_{name}", call) for place in movies for name, call in folder_calls(place)]
     for place in movies:
         bin_file = f"../{place}_bin/bin.aaf"
@@ -205,6 +215,8 @@ def main(laid_out, program, movies, types, work, media=None):
                 list(pool.map(lambda call: comparison.call(*call), calls))
     finally:
         windows.stop()
+    for kind in sorted({".aaf", ".png", ".wav"} - comparison.kinds):
+        comparison.faults.append(f"no {kind} file was compared")
     for fault in sorted(comparison.faults):
         print(fault)
     print(f"{comparison.calls} calls under Wine and on Linux, {comparison.files} files written by both, "
