@@ -92,7 +92,8 @@ function(test_code name)
   if(NOT CLIPHOST_BATCHES)
     return()
   endif()
-  target_compile_options(${name} PRIVATE -O0 -fpch-preprocess)
+  target_compile_options(${name} PRIVATE -O0 -fpch-preprocess
+    -Wno-subobject-linkage)  # a suite of one file is nobody else's, though a batch includes the file
   if(name STREQUAL test_headers)
     target_precompile_headers(${name} PRIVATE <gmock/gmock.h> <gtest/gtest.h> <algorithm>
       <filesystem> <fstream> <functional> <map> <memory> <string> <vector>)
@@ -101,16 +102,16 @@ function(test_code name)
   endif()
 endfunction()
 
-# test_program(NAME [IN_BATCHES] SOURCES file... LIBS target... [APART suite...] [FILTER pattern]
+# test_program(NAME [SINGLE] SOURCES file... LIBS target... [APART suite...] [FILTER pattern]
 #              [PROPERTIES name value ...])
 # A GoogleTest program, each of whose suites is one of ctest's rows. Of suites that fit one of the
 # regular expressions of APART each test is a row, and so a process, of its own: what they change
-# in their process would be there for their neighbours. IN_BATCHES: compiled as the libraries are,
-# because no two of its files give one name to two things.
+# in their process would be there for their neighbours. It is compiled in batches as the libraries
+# are, so no two of its files give one name to two things; SINGLE: never in batches.
 function(test_program name)
-  cmake_parse_arguments(ARG "IN_BATCHES" "FILTER" "SOURCES;LIBS;APART;PROPERTIES" ${ARGN})
+  cmake_parse_arguments(ARG "SINGLE" "FILTER" "SOURCES;LIBS;APART;PROPERTIES" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
-  if(CLIPHOST_BATCHES AND ARG_IN_BATCHES)
+  if(CLIPHOST_BATCHES AND NOT ARG_SINGLE)
     set_target_properties(${name} PROPERTIES UNITY_BUILD ON)
   endif()
   test_code(${name})
@@ -132,7 +133,7 @@ include([==[${PROJECT_SOURCE_DIR}/cmake/TestRows.cmake]==])
   set_property(DIRECTORY APPEND PROPERTY TEST_INCLUDE_FILES ${base}_program.cmake)
 endfunction()
 
-# project_test(NAME [IN_BATCHES] SOURCES file... LIBS target... [APART suite...] [LABEL label])
+# project_test(NAME [SINGLE] SOURCES file... LIBS target... [APART suite...] [LABEL label])
 # A program of unit tests.
 function(project_test name)
   cmake_parse_arguments(ARG "" "LABEL" "" ${ARGN})

@@ -213,8 +213,8 @@ private:
     Worst alpha_{"alpha", kRounded};
 };
 
-std::vector<std::string> Differences(cliphost::Essence& essence, cliphost::TrackKind kind,
-                                     const PlainPictures& plain) {
+std::vector<std::string> TrackDifferences(cliphost::Essence& essence, cliphost::TrackKind kind,
+                                          const PlainPictures& plain) {
     const cliphost::ClipTrack* const track = essence.First(kind);
     if (!track) {
         return {fmt::format("there is no {} track", cliphost::NameOf(kind))};
@@ -243,9 +243,9 @@ std::vector<std::string> Differences(cliphost::Essence& essence, cliphost::Track
 
 std::vector<std::string> PictureDifferences(cliphost::Essence& essence,
                                             const PlainPictures& plain) {
-    return Differences(essence, cliphost::TrackKind::Picture, plain);
+    return TrackDifferences(essence, cliphost::TrackKind::Picture, plain);
 }
 
 std::vector<std::string> AlphaDifferences(cliphost::Essence& essence, const PlainPictures& plain) {
-    return Differences(essence, cliphost::TrackKind::Alpha, plain);
+    return TrackDifferences(essence, cliphost::TrackKind::Alpha, plain);
 }

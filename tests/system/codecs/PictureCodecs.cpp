@@ -172,7 +172,7 @@ struct PictureFeature {
     const char* copyBehind = "";
 };
 
-constexpr PictureFeature kFeatures[] = {
+constexpr PictureFeature kPictureFeatures[] = {
     {"rotated_90", "-c:v libx264 -metadata:s:v rotate=90", "yuv420p", "mp4"},
     {"rotated_180", "-c:v mpeg4 -metadata:s:v rotate=180", "yuv420p", "mov"},
     {"rotated_270", "-c:v libx264 -metadata:s:v rotate=270", "yuv420p", "mov"},
@@ -225,7 +225,7 @@ std::vector<CodecCase> PictureCodecCases() {
             }
         }
     }
-    for (const PictureFeature& feature : kFeatures) {
+    for (const PictureFeature& feature : kPictureFeatures) {
         cases.push_back({feature.name, Source("160x96", feature.pixels),
                          std::string(feature.options) + " -pix_fmt " + feature.pixels,
                          feature.ending, true, feature.copyBefore, feature.copyBehind, "", true});

@@ -22,7 +22,7 @@ struct SoundFeature {
 
 constexpr const char* kAac = "-c:a aac -aac_pns 0";
 
-constexpr SoundFeature kFeatures[] = {
+constexpr SoundFeature kSoundFeatures[] = {
     {"aac_in_fragments", "-c:a aac -aac_pns 0 -movflags +frag_keyframe+empty_moov", "mp4"},
     {"aac_with_an_edit", kAac, "mov", "-ss 0.2"},
     {"aac_with_an_edit_in_the_first_packet", kAac, "mp4", "-ss 0.005"},
@@ -47,7 +47,7 @@ std::vector<CodecCase> SoundCodecCases() {
                          codec.ending, codec.isBrief, "", "", codec.reading,
                          codec.isExactAnywhere});
     }
-    for (const SoundFeature& feature : kFeatures) {
+    for (const SoundFeature& feature : kSoundFeatures) {
         cases.push_back({feature.name, SoundSource(feature.rate, "stereo", kSeconds),
                          feature.encoder, feature.ending, true, feature.copyBefore,
                          feature.copyBehind});

@@ -14,7 +14,7 @@
 namespace NMA::Impl {
 namespace {
 
-constexpr char kFunction[] = "NMA::Impl::AddAudioDescriptor";
+constexpr char kAddAudioDescriptor[] = "NMA::Impl::AddAudioDescriptor";
 
 class AudioDescriptorTest : public AAFTest {
 protected:
@@ -50,7 +50,7 @@ TEST_F(AudioDescriptorTest, ChecksItsArgumentsInOrder) {
     }
     std::vector<std::string> expected;
     for (const char* name : {"media.get()", "pConsole", "pDictionary", "pMultiDescriptor"}) {
-        expected.push_back(std::string("CHK_INARG(") + name + ")" + kFunction);
+        expected.push_back(std::string("CHK_INARG(") + name + ")" + kAddAudioDescriptor);
     }
     EXPECT_EQ(texts, expected);
 }
@@ -198,8 +198,8 @@ TEST_F(AudioDescriptorTest, OnlyTheFirstDescriptorSetsTheRateOfAll) {
 
 TEST_F(AudioDescriptorTest, TellsTrackChannelsAndBits) {
     ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_TRUE(log.once(std::string(kFunction) + "qtTrack: 2; numAudioChannels: 2"));
-    EXPECT_TRUE(log.once(std::string(kFunction) + "qtTrack: 2; quantizationBits: 16"));
+    EXPECT_TRUE(log.once(std::string(kAddAudioDescriptor) + "qtTrack: 2; numAudioChannels: 2"));
+    EXPECT_TRUE(log.once(std::string(kAddAudioDescriptor) + "qtTrack: 2; quantizationBits: 16"));
 }
 
 TEST_F(AudioDescriptorTest, ARefusedCellDoesNotEndTheClip) {
@@ -266,7 +266,7 @@ TEST_F(AudioDescriptorTest, FailuresOfTheClipAreLoggedAndReturned) {
         Track().native = native;
         clip->failures = {{operation, NCF_E_NOTFOUND}};
         EXPECT_EQ(Add(), NCF_E_NOTFOUND) << operation;
-        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kFunction)) << operation;
+        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kAddAudioDescriptor)) << operation;
     }
 }
 
@@ -278,14 +278,15 @@ TEST_F(AudioDescriptorTest, FailuresOfTheWrapperAreLoggedAndReturned) {
         log.returned(NCF_E_NOTFOUND,
                      "qtWrapper->GetAudioInfoForTrack(qtTrack, &numAudioChannels, &sampleRate, "
                      "&formatID, NULL, &bytesPerPacket, NULL, NULL, NULL, NULL)",
-                     kFunction));
+                     kAddAudioDescriptor));
 }
 
 TEST_F(AudioDescriptorTest, AWrapperThatCannotBeMadeIsLoggedAndReturned) {
     Track().native = 0;
     host.refuseCreation(QTWrapper::CompID_QuickTimeWrapper, NCF_E_NOTFOUND);
     EXPECT_EQ(Add(), NCF_E_NOTFOUND);
-    EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, "media->GetQuickTimeInterface(qtWrapper)", kFunction));
+    EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, "media->GetQuickTimeInterface(qtWrapper)",
+                             kAddAudioDescriptor));
 }
 
 struct RefusedCall {
@@ -309,7 +310,7 @@ TEST_P(AudioRefusalTest, IsLoggedWithItsStatementAndReturned) {
     Track().metadata.isBigEndian = refused.bigEndian;
     aaf.refuse(refused.call, AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), AAFRESULT_NOMEMORY);
-    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, refused.statement, kFunction));
+    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, refused.statement, kAddAudioDescriptor));
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -357,7 +358,7 @@ TEST_F(AudioDescriptorTest, ARefusedViewIsLoggedAndReturned) {
         aaf.clearRefusals();
         aaf.refuse("PCMDescriptor", AAFRESULT_NOMEMORY, ++nth);
         EXPECT_EQ(Add(), AAFRESULT_NOMEMORY) << name;
-        EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, statement, kFunction)) << name;
+        EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, statement, kAddAudioDescriptor)) << name;
     }
 }
 

@@ -13,7 +13,7 @@
 namespace NMA::Impl {
 namespace {
 
-constexpr char kFunction[] = "NMA::Impl::NewAAFFromMovie";
+constexpr char kNewAAFFromMovie[] = "NMA::Impl::NewAAFFromMovie";
 
 class NewAAFFromMovieTest : public AAFTest {
 protected:
@@ -210,8 +210,8 @@ TEST_F(NewAAFFromMovieTest, ChecksItsArguments) {
     IAAFFile* out = nullptr;
     EXPECT_EQ(NewAAFFromMovie(none, Console(), &out, host.factory()), NCF_E_INVALIDARG);
     EXPECT_EQ(NewAAFFromMovie(Media(), Console(), nullptr, host.factory()), NCF_E_INVALIDARG);
-    EXPECT_TRUE(log.once(std::string("CHK_INARG(media.get())") + kFunction));
-    EXPECT_TRUE(log.once(std::string("CHK_INARG(pOutAAFFile)") + kFunction));
+    EXPECT_TRUE(log.once(std::string("CHK_INARG(media.get())") + kNewAAFFromMovie));
+    EXPECT_TRUE(log.once(std::string("CHK_INARG(pOutAAFFile)") + kNewAAFFromMovie));
 }
 
 TEST_F(NewAAFFromMovieTest, AnEmptyPathFailsBeforeTheFileIsOpened) {
@@ -247,7 +247,7 @@ TEST_F(NewAAFFromMovieTest, AFailureInTheTracksLeavesNoMobInTheHeader) {
                              "AddTracksToAAF(media, pConsole, pHeader, pDictionary, pMobMasterMob, "
                              "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, "
                              "pMultiDescriptor, pComponentFactory, &absoluteStartTime)",
-                             kFunction));
+                             kNewAAFFromMovie));
 }
 
 TEST_F(NewAAFFromMovieTest, FailuresOfTheClipAreLoggedAndReturned) {
@@ -259,7 +259,7 @@ TEST_F(NewAAFFromMovieTest, FailuresOfTheClipAreLoggedAndReturned) {
     for (const auto& [operation, statement] : statements) {
         clip->failures = {{operation, NMA_E_NOTINITIALIZED}};
         EXPECT_EQ(Describe(), NMA_E_NOTINITIALIZED) << operation;
-        EXPECT_TRUE(log.returned(NMA_E_NOTINITIALIZED, statement, kFunction));
+        EXPECT_TRUE(log.returned(NMA_E_NOTINITIALIZED, statement, kNewAAFFromMovie));
     }
 }
 
@@ -286,7 +286,7 @@ TEST_P(DescriptionRefusalTest, IsLoggedWithItsStatementAndReturned) {
     clip->setAlpha(true, false);
     aaf.refuse(GetParam().call, AAFRESULT_NOMEMORY);
     EXPECT_EQ(Describe(), AAFRESULT_NOMEMORY);
-    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, GetParam().statement, kFunction));
+    EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY, GetParam().statement, kNewAAFFromMovie));
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -352,20 +352,21 @@ TEST_F(NewAAFFromMovieTest, ARefusedSourceMobOrEssenceViewIsLogged) {
     EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY,
                              "defs.cdSourceMob()->CreateInstance(IID_IAAFMob, (IUnknown "
                              "**)&pMobSourceMob)",
-                             kFunction));
+                             kNewAAFFromMovie));
     // The multiple descriptor's essence view is asked after all tracks.
     aaf.refuse("MultipleDescriptor1.QueryInterface", AAFRESULT_NOMEMORY, 3);
     EXPECT_EQ(Describe(), AAFRESULT_NOMEMORY);
     EXPECT_TRUE(log.returned(AAFRESULT_NOMEMORY,
                              "pMultiDescriptor->QueryInterface "
                              "(IID_IAAFEssenceDescriptor, (void **)&pEssenceDesc)",
-                             kFunction));
+                             kNewAAFFromMovie));
 }
 
 TEST_F(NewAAFFromMovieTest, ARefusedColumnMappingIsLogged) {
     aaf.refuse("MasterMob1.AppendComment 'Field Ordering'");
     EXPECT_EQ(Describe(), NMA_E_AAF_ADD);
-    EXPECT_TRUE(log.returned(NMA_E_AAF_ADD, "AddBinColMappingToMob( pMobMasterMob )", kFunction));
+    EXPECT_TRUE(
+        log.returned(NMA_E_AAF_ADD, "AddBinColMappingToMob( pMobMasterMob )", kNewAAFFromMovie));
 }
 
 TEST_F(NewAAFFromMovieTest, AFailedLookUpIsUnexpected) {
@@ -380,7 +381,7 @@ TEST_F(NewAAFFromMovieTest, WithoutALibraryTheLoadersCodeComesBack) {
     EXPECT_EQ(Describe(), AAFRESULT_DLL_LOAD_FAILED);
     AAFRunTimeLibrary::Instance().SetAccess(before);
     EXPECT_TRUE(log.returned(AAFRESULT_DLL_LOAD_FAILED,
-                             "AAFFileOpenTransient(&productID, &pTheAAFFile)", kFunction));
+                             "AAFFileOpenTransient(&productID, &pTheAAFFile)", kNewAAFFromMovie));
 }
 
 }  // namespace

@@ -14,7 +14,7 @@
 namespace NMA::Impl {
 namespace {
 
-constexpr char kFunction[] = "NMA::Impl::AddSyntheticTimeCode";
+constexpr char kAddSyntheticTimeCode[] = "NMA::Impl::AddSyntheticTimeCode";
 
 class SyntheticTimecodeTest : public AAFTest {
 protected:
@@ -82,7 +82,8 @@ TEST_F(SyntheticTimecodeTest, ADateThatCannotBeReadIsMidnight) {
     EXPECT_EQ(host.console().count(4, "Modification Date is day 0, hour 0, minute 0, second 0\n\n"),
               1);
     // The system's number for a file that is not there is 2 everywhere.
-    EXPECT_TRUE(log.once(std::string(kFunction) + " - FileTimeToSystemTime, hresult: 2"));
+    EXPECT_TRUE(
+        log.once(std::string(kAddSyntheticTimeCode) + " - FileTimeToSystemTime, hresult: 2"));
 }
 
 TEST_F(SyntheticTimecodeTest, TellsTheErrorOfTheFailedQueryNotOfTheLogsOwnWork) {
@@ -100,7 +101,8 @@ TEST_F(SyntheticTimecodeTest, TellsTheErrorOfTheFailedQueryNotOfTheLogsOwnWork) 
     });
     PluginLogSink::Instance().Start(host.factory());
     ASSERT_EQ(Add(), NCF_OK);
-    EXPECT_TRUE(log.once(std::string(kFunction) + " - FileTimeToSystemTime, hresult: 2"));
+    EXPECT_TRUE(
+        log.once(std::string(kAddSyntheticTimeCode) + " - FileTimeToSystemTime, hresult: 2"));
 }
 
 TEST_F(SyntheticTimecodeTest, AfterOtherSlotsTheMainSlotsFillerEndsTheClip) {
@@ -130,12 +132,12 @@ TEST_F(SyntheticTimecodeTest, ChecksItsArgumentsInOrder) {
     for (const LoggedRecord& record : log.records()) {
         texts.push_back(record.text);
     }
-    EXPECT_EQ(texts,
-              (std::vector<std::string>{std::string("CHK_PTR(media.get())") + kFunction,
-                                        std::string("CHK_PTR(totalExistingSlots)") + kFunction,
-                                        std::string("CHK_PTR(pConsole)") + kFunction,
-                                        std::string("CHK_PTR(pDictionary)") + kFunction,
-                                        std::string("CHK_PTR(pMobSourceMob)") + kFunction}));
+    EXPECT_EQ(texts, (std::vector<std::string>{
+                         std::string("CHK_PTR(media.get())") + kAddSyntheticTimeCode,
+                         std::string("CHK_PTR(totalExistingSlots)") + kAddSyntheticTimeCode,
+                         std::string("CHK_PTR(pConsole)") + kAddSyntheticTimeCode,
+                         std::string("CHK_PTR(pDictionary)") + kAddSyntheticTimeCode,
+                         std::string("CHK_PTR(pMobSourceMob)") + kAddSyntheticTimeCode}));
 }
 
 TEST_F(SyntheticTimecodeTest, NeedsRateAndLength) {
@@ -143,8 +145,8 @@ TEST_F(SyntheticTimecodeTest, NeedsRateAndLength) {
     EXPECT_EQ(Add(), NMA_E_NOTINITIALIZED);
     clip->failures = {{"GetMovieLength", NMA_E_NOTINITIALIZED}};
     EXPECT_EQ(Add(), NMA_E_NOTINITIALIZED);
-    EXPECT_TRUE(
-        log.returned(NMA_E_NOTINITIALIZED, "media->GetMovieLength(&movieLength)", kFunction));
+    EXPECT_TRUE(log.returned(NMA_E_NOTINITIALIZED, "media->GetMovieLength(&movieLength)",
+                             kAddSyntheticTimeCode));
 }
 
 TEST_F(SyntheticTimecodeTest, ARateThatRoundsToNothingIsRefused) {
@@ -154,7 +156,7 @@ TEST_F(SyntheticTimecodeTest, ARateThatRoundsToNothingIsRefused) {
     EXPECT_TRUE(log.returned(NCF_E_INVALIDARG,
                              "ConvertTCToFrames( pUTCTime->tm_hour, pUTCTime->tm_min, "
                              "pUTCTime->tm_sec, 0, numFPS, TRUE, &tcInFrames)",
-                             kFunction));
+                             kAddSyntheticTimeCode));
 }
 
 TEST_F(SyntheticTimecodeTest, LogsTheSlotThatFailed) {
@@ -164,7 +166,7 @@ TEST_F(SyntheticTimecodeTest, LogsTheSlotThatFailed) {
         log.returned(NMA_E_AAF_ADD,
                      "AddTimecodeAAFTrack( timecode, tcTrackNum++, (*totalExistingSlots)++, "
                      "aafEditRate, maxDuration, 0, 0, pDictionary, pMobSourceMob)",
-                     kFunction));
+                     kAddSyntheticTimeCode));
     slots = 0;
     aaf.refuse("SourceMob1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY, 2);
     EXPECT_EQ(Add(), NMA_E_AAF_ADD);
@@ -172,7 +174,7 @@ TEST_F(SyntheticTimecodeTest, LogsTheSlotThatFailed) {
         log.returned(NMA_E_AAF_ADD,
                      "AddTimecodeAAFTrack( auxTimecode, tcTrackNum, (*totalExistingSlots)++, "
                      "aafEditRate, movieLength, maxDuration, 0, pDictionary, pMobSourceMob)",
-                     kFunction));
+                     kAddSyntheticTimeCode));
 }
 
 }  // namespace

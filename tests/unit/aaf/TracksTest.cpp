@@ -15,7 +15,7 @@
 namespace NMA::Impl {
 namespace {
 
-constexpr char kFunction[] = "NMA::Impl::AddTracksToAAF";
+constexpr char kAddTracksToAAF[] = "NMA::Impl::AddTracksToAAF";
 
 class TracksTest : public AAFTest {
 protected:
@@ -100,7 +100,7 @@ TEST_F(TracksTest, TellsTheFirstMissingArgumentAlone) {
                 NCF_E_POINTER);
             ASSERT_EQ(log.records().size(), 1u) << names[missing];
             EXPECT_EQ(log.records()[0].text,
-                      std::string("CHK_PTR(") + names[missing] + ")" + kFunction);
+                      std::string("CHK_PTR(") + names[missing] + ")" + kAddTracksToAAF);
         }
     }
 }
@@ -232,7 +232,7 @@ TEST_F(TracksTest, AlphaWithoutAVideoTrackNeedsARetrieverBeforeAnyDescriptor) {
     clip->timecode.resize(1);
     clip->setAlpha(true, false);
     const std::string missing =
-        std::string("NCFASSERT( QuickTimeToAAFInfoRetriever::GetInstance() )") + kFunction;
+        std::string("NCFASSERT( QuickTimeToAAFInfoRetriever::GetInstance() )") + kAddTracksToAAF;
     EXPECT_EQ(Add(), NCF_E_FAIL);
     EXPECT_TRUE(log.once(missing));
     EXPECT_EQ(QuickTimeToAAFInfoRetriever::GetInstance(), nullptr) << "no track: no data files";
@@ -307,7 +307,7 @@ TEST_F(TracksTest, TimecodeWithoutARateIsRefused) {
         NCF_E_INVALIDARG,
         "ConvertTCToFrames(tcInfo.hours, tcInfo.minutes, tcInfo.seconds, tcInfo.frames, "
         "tcFPS, *((bool*)&tcInfo.drop), &tcInFrames)",
-        kFunction));
+        kAddTracksToAAF));
 }
 
 TEST_F(TracksTest, AScaledStartGoesBeyond32Bits) {
@@ -385,7 +385,7 @@ TEST_F(TracksTest, FailuresOfTheClipAreLoggedAndReturned) {
         log.clear();
         clip->failures = {{operation, NCF_E_NOTFOUND}};
         EXPECT_EQ(Add(), NCF_E_NOTFOUND) << operation;
-        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kFunction)) << operation;
+        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kAddTracksToAAF)) << operation;
     }
 }
 
@@ -398,7 +398,7 @@ TEST_F(TracksTest, SlotsThatAreRefusedAreLoggedAndReturned) {
                      "AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, "
                      "totalExistingSlots++, aaf_rate, movieLength, pDictionary, pMobMasterMob, "
                      "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 )",
-                     kFunction));
+                     kAddTracksToAAF));
     clip->videoTracks = 0;
     clip->sound.resize(1);
     aaf.clearRefusals();
@@ -409,7 +409,7 @@ TEST_F(TracksTest, SlotsThatAreRefusedAreLoggedAndReturned) {
                      "AddAAFTrack(dataDefUID, slotFormatLabel, slotsToAdd, startingSlot, "
                      "totalExistingSlots, aaf_rate, movieLength, pDictionary, pMobMasterMob, "
                      "pMasterMob, pMobFileMob, pFileMob, pMobSourceMob, pSourceMob, 0 )",
-                     kFunction));
+                     kAddTracksToAAF));
     aaf.clearRefusals();
     aaf.refuse("Source1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY);
     EXPECT_EQ(Add(), NMA_E_AAF_ADD);
@@ -417,7 +417,7 @@ TEST_F(TracksTest, SlotsThatAreRefusedAreLoggedAndReturned) {
         log.returned(NMA_E_AAF_ADD,
                      "AddTimecodeAAFTrack(timecode, startingSlot, totalExistingSlots++, aaf_rate, "
                      "maxDuration, maxDuration, 0, pDictionary, pMobSourceMob)",
-                     kFunction));
+                     kAddTracksToAAF));
     clip->timecode.clear();
     aaf.clearRefusals();
     aaf.refuse("Source1.AppendNewTimelineSlot", AAFRESULT_NOMEMORY);
@@ -425,7 +425,7 @@ TEST_F(TracksTest, SlotsThatAreRefusedAreLoggedAndReturned) {
     EXPECT_TRUE(log.returned(NMA_E_AAF_ADD,
                              "AddSyntheticTimeCode(media, &totalExistingSlots, pConsole, "
                              "pDictionary, pMobSourceMob)",
-                             kFunction));
+                             kAddTracksToAAF));
 }
 
 TEST_F(TracksTest, MissingDataFilesEndEveryClipWithVideo) {
@@ -437,7 +437,7 @@ TEST_F(TracksTest, MissingDataFilesEndEveryClipWithVideo) {
             log.count(ReturnRecord(NCF_E_UNEXPECTED,
                                    "QuickTimeToAAFInfoRetriever::Init(pConsole, pComponentFactory, "
                                    "fourCharXML, AAFInfoXML)",
-                                   kFunction)),
+                                   kAddTracksToAAF)),
             time);
     }
     EXPECT_TRUE(Slots().empty());

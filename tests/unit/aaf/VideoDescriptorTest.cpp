@@ -9,7 +9,7 @@
 namespace NMA::Impl {
 namespace {
 
-constexpr char kFunction[] = "NMA::Impl::AddVideoDescriptor";
+constexpr char kAddVideoDescriptors[] = "NMA::Impl::AddVideoDescriptor";
 
 // Without queries for other interfaces.
 std::vector<std::string> CallsUntilTheLength(const std::vector<std::string>& lines) {
@@ -44,7 +44,7 @@ TEST_F(VideoDescriptorTest, ChecksItsArgumentsInOrder) {
     std::vector<std::string> expected;
     for (const char* name : {"media.get()", "pConsole", "pMobMasterMob", "pHeader", "pDictionary",
                              "pMultiDescriptor"}) {
-        expected.push_back(std::string("CHK_PTR(") + name + ")" + kFunction);
+        expected.push_back(std::string("CHK_PTR(") + name + ")" + kAddVideoDescriptors);
     }
     EXPECT_EQ(texts, expected);
 }
@@ -159,7 +159,7 @@ TEST_F(VideoDescriptorTest, APictureOfNoSizeIsRefused) {
     clip->layout = 1;
     EXPECT_EQ(Add(), NCF_E_FAIL);
     EXPECT_TRUE(log.once(std::string("NCFASSERT( aafInfo.displayHeight && aafInfo.displayWidth )") +
-                         kFunction));
+                         kAddVideoDescriptors));
     // What comes before the display is set, nothing behind it.
     EXPECT_TRUE(aaf.has("CDCIDescriptor1.SetSampledView 0 0 0 0"));
     EXPECT_FALSE(Called("SetDisplayView"));
@@ -382,7 +382,7 @@ TEST_F(VideoDescriptorTest, AnEmptyLineMapIsTheLibrarysToRefuse) {
                              "pDigitalImageDescriptor->SetVideoLineMap( "
                              "(aafUInt32)aafInfo.videoLineMapVect.size(), "
                              "(aafInt32*)&aafInfo.videoLineMapVect[0] )",
-                             kFunction));
+                             kAddVideoDescriptors));
 }
 
 TEST_F(VideoDescriptorTest, AFailedPolicyIsReturnedAsItStands) {
@@ -407,15 +407,16 @@ TEST_F(VideoDescriptorTest, FailuresOfTheClipAreLoggedAndReturned) {
     for (const auto& [operation, statement] : statements) {
         clip->failures = {{operation, NCF_E_NOTFOUND}};
         EXPECT_EQ(Add(), NCF_E_NOTFOUND) << operation;
-        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kFunction)) << operation;
+        EXPECT_TRUE(log.returned(NCF_E_NOTFOUND, statement, kAddVideoDescriptors)) << operation;
     }
 }
 
 TEST_F(VideoDescriptorTest, ARefusedFileFormatCellEndsTheClip) {
     aaf.refuse("MasterMob1.AppendComment 'Video File Format'");
     EXPECT_EQ(Add(), NCF_E_FAIL);
-    EXPECT_TRUE(log.returned(
-        NCF_E_FAIL, "AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0], &QTVff[0])", kFunction));
+    EXPECT_TRUE(log.returned(NCF_E_FAIL,
+                             "AddBinColumnEntry(pMobMasterMob, pConsole, &vff[0], &QTVff[0])",
+                             kAddVideoDescriptors));
 }
 
 TEST_F(VideoDescriptorTest, TheMultipleDescriptorsRateIsSetOnceOnly) {

@@ -9,7 +9,7 @@ using namespace std::chrono_literals;
 
 namespace {
 
-using Paths = std::vector<std::filesystem::path>;
+using ArrivedPaths = std::vector<std::filesystem::path>;
 
 class ArrivalsTest : public testing::Test {
 protected:
@@ -18,7 +18,7 @@ protected:
     }
     void Remove(const std::string& file) { files_.erase(file); }
     void See(const std::string& file) { arrivals_.See(file, now_); }
-    Paths TakeAfter(std::chrono::seconds time) { return arrivals_.Take(now_ += time); }
+    ArrivedPaths TakeAfter(std::chrono::seconds time) { return arrivals_.Take(now_ += time); }
     Arrivals::Clock::time_point now_{};
     std::map<std::string, host::system::FileState> files_;
     Arrivals arrivals_{5s, [this](const std::filesystem::path& file) {
@@ -33,10 +33,10 @@ TEST_F(ArrivalsTest, WaitForRest) {
     Write("a", 1);
     See("b");
     See("a");
-    EXPECT_EQ(TakeAfter(4s), Paths{});
+    EXPECT_EQ(TakeAfter(4s), ArrivedPaths{});
     EXPECT_EQ(arrivals_.Next(), Arrivals::Clock::time_point(5s));
-    EXPECT_EQ(TakeAfter(1s), (Paths{"a", "b"}));
-    EXPECT_EQ(TakeAfter(100s), Paths{});
+    EXPECT_EQ(TakeAfter(1s), (ArrivedPaths{"a", "b"}));
+    EXPECT_EQ(TakeAfter(100s), ArrivedPaths{});
     EXPECT_EQ(arrivals_.Next(), std::nullopt);
 }
 
@@ -44,41 +44,41 @@ TEST_F(ArrivalsTest, BeginAgainWhileFilesGrow) {
     Write("a", 1);
     See("a");
     Write("a", 2);  // nobody tells
-    EXPECT_EQ(TakeAfter(5s), Paths{});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{});
     Write("a", 2, 2);
     now_ += 3s;
     See("a");  // somebody tells
-    EXPECT_EQ(TakeAfter(4s), Paths{});
+    EXPECT_EQ(TakeAfter(4s), ArrivedPaths{});
     See("a");  // nothing new
-    EXPECT_EQ(TakeAfter(1s), Paths{"a"});
+    EXPECT_EQ(TakeAfter(1s), ArrivedPaths{"a"});
 }
 
 TEST_F(ArrivalsTest, ComeAgainWhenTheyChange) {
     Write("a", 1);
     See("a");
-    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{"a"});
     See("a");
-    EXPECT_EQ(TakeAfter(5s), Paths{});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{});
     Write("a", 1, 2);
     See("a");
-    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{"a"});
 }
 
 TEST_F(ArrivalsTest, MayGoAway) {
     Write("a", 1);
     See("a");
     Remove("a");
-    EXPECT_EQ(TakeAfter(5s), Paths{});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{});
     See("a");
     EXPECT_EQ(arrivals_.Next(), std::nullopt);
     Write("a", 1);
     See("a");
-    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{"a"});
     Remove("a");
     See("a");
     Write("a", 1);  // as it was
     See("a");
-    EXPECT_EQ(TakeAfter(5s), Paths{"a"});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{"a"});
 }
 
 TEST_F(ArrivalsTest, ComeAgainAfterTheyWereRemovedAndNobodyTold) {
@@ -90,14 +90,14 @@ TEST_F(ArrivalsTest, ComeAgainAfterTheyWereRemovedAndNobodyTold) {
     EXPECT_EQ(TakeAfter(5s).size(), 2u);
     arrivals_.LookForRemoved();
     See(here);
-    EXPECT_EQ(TakeAfter(5s), Paths{});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{});
     for (const std::string& file : {here, std::string("/no/such/folder/b")}) {
         Remove(file);
         arrivals_.LookForRemoved();
         Write(file, 1);
         See(file);
     }
-    EXPECT_EQ(TakeAfter(5s), Paths{here});
+    EXPECT_EQ(TakeAfter(5s), ArrivedPaths{here});
 }
 
 }  // namespace

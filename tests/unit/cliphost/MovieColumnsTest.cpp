@@ -17,7 +17,7 @@ std::uint64_t RowOf(const MovieColumns& columns, const char* movie) {
     return row ? row->number : 0;
 }
 
-void ExpectRefused(std::string_view text, const std::string& words) {
+void ExpectNoColumns(std::string_view text, const std::string& words) {
     try {
         const MovieColumns columns("t.csv", text);
         ADD_FAILURE() << "taken: " << text;
@@ -70,15 +70,15 @@ TEST(MovieColumns, KnowsWhatColumnsAreFor) {
 }
 
 TEST(MovieColumns, RefusesWhatHasTwoMeanings) {
-    ExpectRefused("scene\n1\n", "no column tells which movie a row is for");
-    ExpectRefused("name,Scene,scene\n", "row 1: columns 2 and 3 (scene) are for the same");
-    ExpectRefused("name,reel,Tape\n", "row 1: columns 2 and 3 (Tape) are for the same");
-    ExpectRefused("name,_x\n", "row 1: column _x: names that begin with _");
-    ExpectRefused("name,x\na,1\na,2\n", "rows 2 and 3 are both for a");
-    ExpectRefused("path,x\n/m/a,1\n/m/./a,2\n", "rows 2 and 3 are both for /m/./a");
-    ExpectRefused("path,x\n,1\n", "row 2: it names no movie");
-    ExpectRefused("name,\na,1\n", "row 2: column 2 has no name in the first row");
-    ExpectRefused("name,start\na,1\n", "row 2, column start: '1' is no timecode");
+    ExpectNoColumns("scene\n1\n", "no column tells which movie a row is for");
+    ExpectNoColumns("name,Scene,scene\n", "row 1: columns 2 and 3 (scene) are for the same");
+    ExpectNoColumns("name,reel,Tape\n", "row 1: columns 2 and 3 (Tape) are for the same");
+    ExpectNoColumns("name,_x\n", "row 1: column _x: names that begin with _");
+    ExpectNoColumns("name,x\na,1\na,2\n", "rows 2 and 3 are both for a");
+    ExpectNoColumns("path,x\n/m/a,1\n/m/./a,2\n", "rows 2 and 3 are both for /m/./a");
+    ExpectNoColumns("path,x\n,1\n", "row 2: it names no movie");
+    ExpectNoColumns("name,\na,1\n", "row 2: column 2 has no name in the first row");
+    ExpectNoColumns("name,start\na,1\n", "row 2, column start: '1' is no timecode");
 }
 
 }  // namespace

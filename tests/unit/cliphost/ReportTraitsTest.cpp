@@ -10,7 +10,7 @@ using cliphost::MediaServed;
 
 namespace {
 
-std::string Told(const std::vector<std::string>& notices) {
+std::string TraitsOf(const std::vector<std::string>& notices) {
     nlohmann::ordered_json facts = nlohmann::ordered_json::object();
     cliphost::AddServedMedia(MediaServed(notices), facts);
     std::string text;
@@ -21,22 +21,22 @@ std::string Told(const std::vector<std::string>& notices) {
 }
 
 TEST(ServedMediaOfMovies, AreToldWithTheReasonBeforeThem) {
-    EXPECT_EQ(Told({"The movie contains alpha.", "Forcing sample provider mode for video.",
-                    "An audio bit rate of 8 was found.",
-                    "Forcing sample provider mode for audio track 2."}),
+    EXPECT_EQ(TraitsOf({"The movie contains alpha.", "Forcing sample provider mode for video.",
+                        "An audio bit rate of 8 was found.",
+                        "Forcing sample provider mode for audio track 2."}),
               "video: The movie contains alpha.; audio track 2: An audio bit rate of 8 was found.");
 }
 
 TEST(ServedMediaOfMovies, AreForTheirCodecWhereNoReasonIsTold) {
-    EXPECT_EQ(Told({"Forcing sample provider mode for video.", "Color primaries unavailable",
-                    "Forcing sample provider mode for audio track 2."}),
+    EXPECT_EQ(TraitsOf({"Forcing sample provider mode for video.", "Color primaries unavailable",
+                        "Forcing sample provider mode for audio track 2."}),
               "video: the data files have no whole record of its codec; audio track 2: it is no "
               "linear PCM");
 }
 
 TEST(ServedMediaOfMovies, AreNoneWhereTheModuleTellsNothing) {
-    EXPECT_EQ(Told({}), "");
-    EXPECT_EQ(Told({"Something else"}), "");
+    EXPECT_EQ(TraitsOf({}), "");
+    EXPECT_EQ(TraitsOf({"Something else"}), "");
 }
 
 }  // namespace

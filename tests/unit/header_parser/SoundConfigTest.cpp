@@ -16,21 +16,21 @@ using movies::Box;
 using movies::Bytes;
 using movies::SoundFormat;
 
-struct Told {
+struct ToldSound {
     ncfUInt32 channels = 0;
     double rate = 0;
 
-    bool operator==(const Told& other) const {
+    bool operator==(const ToldSound& other) const {
         return channels == other.channels && rate == other.rate;
     }
 };
 
-std::ostream& operator<<(std::ostream& out, const Told& told) {
+std::ostream& operator<<(std::ostream& out, const ToldSound& told) {
     return out << told.channels << " channels at " << told.rate;
 }
 
 // The fields say 2 channels at 48000.
-Told Parse(const std::string& codec, const Box& config, bool isWave = false) {
+ToldSound ParseConfig(const std::string& codec, const Box& config, bool isWave = false) {
     SoundFormat format;
     format.codec = codec;
     format.extensions = {config};
@@ -50,7 +50,7 @@ Told Parse(const std::string& codec, const Box& config, bool isWave = false) {
             Ask(description, &IAudioSampleDescription::GetSampleRate)};
 }
 
-constexpr Told kTemplate{2, 48000};
+constexpr ToldSound kTemplate{2, 48000};
 
 // With sizes in one byte each, as they need.
 Box Esds(unsigned kind, const Bytes& config) {
@@ -75,7 +75,7 @@ TEST(SoundConfig, OfAacTellsChannelsAndRate) {
     struct Case {
         const char* name;
         Bytes config;
-        Told told;
+        ToldSound told;
     };
     for (const Case& c : {
              Case{"plain", {0x12, 0x10}, {2, 44100}},
@@ -93,9 +93,9 @@ TEST(SoundConfig, OfAacTellsChannelsAndRate) {
          }) {
         SCOPED_TRACE(c.name);
         for (const unsigned kind : {0x40u, 0x66u, 0x67u, 0x68u}) {
-            EXPECT_EQ(Parse("mp4a", Esds(kind, c.config)), c.told);
+            EXPECT_EQ(ParseConfig("mp4a", Esds(kind, c.config)), c.told);
         }
-        EXPECT_EQ(Parse("mp4a", Esds(0x40, c.config), true), c.told);
+        EXPECT_EQ(ParseConfig("mp4a", Esds(0x40, c.config), true), c.told);
     }
 }
 
@@ -103,13 +103,13 @@ TEST(SoundConfig, OfAacTellsChannelsAndRate) {
 // a pair, one pair behind, one low.
 TEST(SoundConfig, OfAacCountsTheChannelsOfAProgram) {
     const Bytes config = {0x11, 0x80, 0x04, 0xC8, 0x05, 0x00, 0x01, 0x08, 0x80};
-    EXPECT_EQ(Parse("mp4a", Esds(0x40, config)), (Told{6, 48000}));
+    EXPECT_EQ(ParseConfig("mp4a", Esds(0x40, config)), (ToldSound{6, 48000}));
 }
 
 // Of another kind, here of speech, the same bits mean something else.
 TEST(SoundConfig, OfAacWithoutAProgramLeavesTheChannels) {
     const Bytes config = {0x41, 0x80, 0x04, 0xC8, 0x05, 0x00, 0x01, 0x08, 0x80};
-    EXPECT_EQ(Parse("mp4a", Esds(0x40, config)), (Told{2, 48000}));
+    EXPECT_EQ(ParseConfig("mp4a", Esds(0x40, config)), (ToldSound{2, 48000}));
 }
 
 // Each bit of the further speakers by itself, from the highest.
@@ -117,44 +117,45 @@ TEST(SoundConfig, OfEac3CountsFurtherSpeakersByTheirBits) {
     constexpr unsigned kSpeakers[] = {1, 1, 2, 2, 2, 1, 1, 2, 2};
     for (unsigned i = 0; i < 9; ++i) {
         const Box config = Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U16(0x0200 | 0x100u >> i);
-        EXPECT_EQ(Parse("ec-3", config), (Told{6 + kSpeakers[i], 48000})) << i;
+        EXPECT_EQ(ParseConfig("ec-3", config), (ToldSound{6 + kSpeakers[i], 48000})) << i;
     }
 }
 
 TEST(SoundConfig, OfOtherKindsTellsChannelsAndRate) {
     Box opus("dOps");
     opus.U8(0).U8(1).U16(312).U32(44100).U16(0).U8(0);
-    EXPECT_EQ(Parse("Opus", opus), (Told{1, 48000}));
-    EXPECT_EQ(Parse("ac-3", Box("dac3").U8(0x50).U8(0x11).U8(0x40)), (Told{2, 44100}));
-    EXPECT_EQ(Parse("ac-3", Box("dac3").U8(0x10).U8(0x3D).U8(0x40)), (Told{6, 48000}));
-    EXPECT_EQ(Parse("ac-3", Box("dac3").U8(0x12).U8(0x10).U8(0)).rate, 24000);
-    EXPECT_EQ(Parse("ec-3", Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U8(0)), (Told{6, 48000}));
-    EXPECT_EQ(Parse("ec-3", Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U16(0x0202)),
-              (Told{8, 48000}));
-    EXPECT_EQ(Parse("fLaC", Box("dfLa").Version(0).U32(0x80000022).Zeros(10).U32(0x0AC440F0)),
-              (Told{1, 44100}));
+    EXPECT_EQ(ParseConfig("Opus", opus), (ToldSound{1, 48000}));
+    EXPECT_EQ(ParseConfig("ac-3", Box("dac3").U8(0x50).U8(0x11).U8(0x40)), (ToldSound{2, 44100}));
+    EXPECT_EQ(ParseConfig("ac-3", Box("dac3").U8(0x10).U8(0x3D).U8(0x40)), (ToldSound{6, 48000}));
+    EXPECT_EQ(ParseConfig("ac-3", Box("dac3").U8(0x12).U8(0x10).U8(0)).rate, 24000);
+    EXPECT_EQ(ParseConfig("ec-3", Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U8(0)),
+              (ToldSound{6, 48000}));
+    EXPECT_EQ(ParseConfig("ec-3", Box("dec3").U16(0x0C00).U8(0x20).U8(0x0F).U16(0x0202)),
+              (ToldSound{8, 48000}));
+    EXPECT_EQ(ParseConfig("fLaC", Box("dfLa").Version(0).U32(0x80000022).Zeros(10).U32(0x0AC440F0)),
+              (ToldSound{1, 44100}));
     Box alac("alac");
     alac.Version(0).U32(4096).U8(0).U8(16).U8(40).U8(10).U8(14).U8(6).U16(255).U32(0).U32(0);
     alac.U32(96000);
-    EXPECT_EQ(Parse("alac", alac), (Told{6, 96000}));
-    EXPECT_EQ(Parse("alac", alac, true), (Told{6, 96000}));
+    EXPECT_EQ(ParseConfig("alac", alac), (ToldSound{6, 96000}));
+    EXPECT_EQ(ParseConfig("alac", alac, true), (ToldSound{6, 96000}));
     const Bytes vorbis = {2, 30, 40, 1, 'v', 'o',  'r',  'b', 'i', 's',
                           0, 0,  0,  0, 1,   0x44, 0xAC, 0,   0};
-    EXPECT_EQ(Parse("mp4a", Esds(0xDD, vorbis)), (Told{1, 44100}));
-    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0x10008001).Zeros(6)), (Told{2, 96000}));
-    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0x80078000).Zeros(6)), (Told{6, 44100}));
-    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0x0007804F).Zeros(6)), (Told{8, 48000}));
-    EXPECT_EQ(Parse("samr", Box("damr").Zeros(9)), (Told{1, 8000}));
-    EXPECT_EQ(Parse("sawb", Box("damr").Zeros(9)), (Told{1, 16000}));
+    EXPECT_EQ(ParseConfig("mp4a", Esds(0xDD, vorbis)), (ToldSound{1, 44100}));
+    EXPECT_EQ(ParseConfig("mlpa", Box("dmlp").U32(0x10008001).Zeros(6)), (ToldSound{2, 96000}));
+    EXPECT_EQ(ParseConfig("mlpa", Box("dmlp").U32(0x80078000).Zeros(6)), (ToldSound{6, 44100}));
+    EXPECT_EQ(ParseConfig("mlpa", Box("dmlp").U32(0x0007804F).Zeros(6)), (ToldSound{8, 48000}));
+    EXPECT_EQ(ParseConfig("samr", Box("damr").Zeros(9)), (ToldSound{1, 8000}));
+    EXPECT_EQ(ParseConfig("sawb", Box("damr").Zeros(9)), (ToldSound{1, 16000}));
 }
 
 TEST(SoundConfig, ThatIsMissingLeavesTheFields) {
     for (const char* const codec :
          {"mp4a", "Opus", "ac-3", "ec-3", "fLaC", "alac", "mlpa", "QDM2"}) {
-        EXPECT_EQ(Parse(codec, Box("free")), kTemplate) << codec;
+        EXPECT_EQ(ParseConfig(codec, Box("free")), kTemplate) << codec;
     }
-    EXPECT_EQ(Parse("mp4a", Esds(0x6B, {})), kTemplate);
-    EXPECT_EQ(Parse("mp4a", Esds(0x99, {0x12, 0x10})), kTemplate);
+    EXPECT_EQ(ParseConfig("mp4a", Esds(0x6B, {})), kTemplate);
+    EXPECT_EQ(ParseConfig("mp4a", Esds(0x99, {0x12, 0x10})), kTemplate);
 }
 
 // Cut at any byte, a configuration tells what stands in it or nothing.
@@ -163,10 +164,10 @@ TEST(SoundConfig, CutShortTellsNothingFalse) {
     const Bytes whole = Esds(0x40, stereo).ToBytes();
     const Bytes body(whole.begin() + 8, whole.end());
     for (std::size_t size = 0; size < body.size(); ++size) {
-        const Told told =
-            Parse("mp4a", Box("esds").Raw({body.begin(), body.begin() + static_cast<int>(size)}));
-        const bool isPossible = told == kTemplate || told == Told{1, 22050} ||
-                                told == Told{1, 44100} || told == Told{2, 44100};
+        const ToldSound told = ParseConfig(
+            "mp4a", Box("esds").Raw({body.begin(), body.begin() + static_cast<int>(size)}));
+        const bool isPossible = told == kTemplate || told == ToldSound{1, 22050} ||
+                                told == ToldSound{1, 44100} || told == ToldSound{2, 44100};
         EXPECT_TRUE(isPossible) << size << ": " << told;
     }
     for (const auto& [codec, config] : {std::pair{"Opus", "dOps"},
@@ -175,7 +176,7 @@ TEST(SoundConfig, CutShortTellsNothingFalse) {
                                         {"fLaC", "dfLa"},
                                         {"alac", "alac"},
                                         {"mlpa", "dmlp"}}) {
-        EXPECT_EQ(Parse(codec, Box(config)).channels, 2u) << config;
+        EXPECT_EQ(ParseConfig(codec, Box(config)).channels, 2u) << config;
     }
 }
 
@@ -184,22 +185,22 @@ TEST(SoundConfig, WithLyingSizesIsReadAsFarAsItGoes) {
     Box esds("esds");
     esds.Version(0).U8(3).U32(0xFFFFFF7F).U16(0).U8(0).U8(4).U32(0xFFFFFF7F).U8(0x40).U8(0x15);
     esds.Zeros(11).U8(5).U32(0xFFFFFF7F).U16(0x1388);
-    EXPECT_EQ(Parse("mp4a", esds), (Told{1, 22050}));
+    EXPECT_EQ(ParseConfig("mp4a", esds), (ToldSound{1, 22050}));
     Box empty("esds");
     empty.Version(0).U8(3).U8(0).U16(0).U8(0).U8(4).U8(0).U8(0x40);
-    EXPECT_EQ(Parse("mp4a", empty), kTemplate);
+    EXPECT_EQ(ParseConfig("mp4a", empty), kTemplate);
     Box url("esds");
     url.Version(0).U8(3).U8(30).U16(0).U8(0x40).U8(255).Zeros(10);
-    EXPECT_EQ(Parse("mp4a", url), kTemplate);
+    EXPECT_EQ(ParseConfig("mp4a", url), kTemplate);
 }
 
 TEST(SoundConfig, OfImpossibleNumbersLeavesTheFields) {
-    EXPECT_EQ(Parse("mp4a", Esds(0x40, {0x16, 0x90})), kTemplate);  // rate 13
+    EXPECT_EQ(ParseConfig("mp4a", Esds(0x40, {0x16, 0x90})), kTemplate);  // rate 13
     Box alac("alac");
     alac.Version(0).U32(4096).U8(0).U8(16).U8(40).U8(10).U8(14).U8(0).U16(255).U32(0).U32(0);
     alac.U32(0xFFFFFFFF);
-    EXPECT_EQ(Parse("alac", alac), kTemplate);
-    EXPECT_EQ(Parse("mlpa", Box("dmlp").U32(0xF0078000).Zeros(6)), kTemplate);
+    EXPECT_EQ(ParseConfig("alac", alac), kTemplate);
+    EXPECT_EQ(ParseConfig("mlpa", Box("dmlp").U32(0xF0078000).Zeros(6)), kTemplate);
 }
 
 TEST(SoundConfig, OfRandomBytesIsTakenOrLeft) {
@@ -217,7 +218,7 @@ TEST(SoundConfig, OfRandomBytesIsTakenOrLeft) {
         const auto& codec = codecs[random() % std::size(codecs)];
         const Box box = random() % 2 && codec[0] == std::string("mp4a") ? Esds(0x40, bytes)
                                                                         : Box(codec[1]).Raw(bytes);
-        const Told told = Parse(codec[0], box);
+        const ToldSound told = ParseConfig(codec[0], box);
         ASSERT_GE(told.rate, 1.0);
         ASSERT_LE(told.rate, 1e9);
         ASSERT_LE(told.channels, 255u);

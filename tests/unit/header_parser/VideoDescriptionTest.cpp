@@ -11,27 +11,27 @@ using movies::VideoFormat;
 
 using Description = host::Ref<IVideoSampleDescription>;
 
-Description Parse(const Box& entry) {
+Description ParseVideo(const Box& entry) {
     movies::Movie movie = PlainMovie();
     movie.tracks[0].descriptions = {entry};
     return ParsedMovie(movie).VideoDescription();
 }
 
-Description Parse(const VideoFormat& format) {
-    return Parse(format.ToBox());
+Description ParseVideo(const VideoFormat& format) {
+    return ParseVideo(format.ToBox());
 }
 
 bool HasAlpha(const char* codec, unsigned depth) {
     VideoFormat format;
     format.codec = codec;
     format.depth = depth;
-    return Ask(Parse(format), &IVideoSampleDescription::HasAlpha) == 1;
+    return Ask(ParseVideo(format), &IVideoSampleDescription::HasAlpha) == 1;
 }
 
 // Count, top field first, split; empty when not available.
 std::vector<ncfUInt32> Fields(const VideoFormat& format) {
     ncfUInt32 count = 0, topFirst = 0, split = 0;
-    const NCFRESULT result = Parse(format)->GetFieldInfo(&count, &topFirst, &split);
+    const NCFRESULT result = ParseVideo(format)->GetFieldInfo(&count, &topFirst, &split);
     EXPECT_TRUE(result == NCF_OK || result == NCF_E_PARAMETERNOTAVAILABLE);
     return result == NCF_OK ? std::vector<ncfUInt32>{count, topFirst, split}
                             : std::vector<ncfUInt32>();
@@ -67,14 +67,14 @@ TEST(VideoDescription, GivesCodecSizeAndVendor) {
     format.vendor = "appl";
     format.width = 1440;
     format.height = 1080;
-    const Description description = Parse(format);
+    const Description description = ParseVideo(format);
     EXPECT_EQ(Ask(description, &IVideoSampleDescription::GetDataFormat), 0x6170636Eu);
     EXPECT_EQ(Ask(description, &IVideoSampleDescription::GetVendor), movies::Code("appl"));
     ncfUInt16 width = 0, height = 0;
     ASSERT_EQ(description->GetEncodedWidthAndHeight(&width, &height), NCF_OK);
     EXPECT_EQ(width, 1440);
     EXPECT_EQ(height, 1080);
-    EXPECT_EQ(Ask(Parse(VideoFormat()), &IVideoSampleDescription::GetVendor), 0u);
+    EXPECT_EQ(Ask(ParseVideo(VideoFormat()), &IVideoSampleDescription::GetVendor), 0u);
 }
 
 TEST(VideoDescription, HasAlphaAtADepthOf32) {
@@ -137,29 +137,29 @@ TEST(VideoDescription, NeedNotBeAskedForAllOfItsFields) {
     VideoFormat format;
     format.fields = {{2, 9}};
     ncfUInt32 count = 0;
-    EXPECT_EQ(Parse(format)->GetFieldInfo(&count, nullptr, nullptr), NCF_OK);
+    EXPECT_EQ(ParseVideo(format)->GetFieldInfo(&count, nullptr, nullptr), NCF_OK);
     EXPECT_EQ(count, 2u);
-    EXPECT_EQ(Parse(format)->GetFieldInfo(nullptr, nullptr, nullptr), NCF_E_POINTER);
+    EXPECT_EQ(ParseVideo(format)->GetFieldInfo(nullptr, nullptr, nullptr), NCF_E_POINTER);
 }
 
 TEST(VideoDescription, ReadsColorsOfBothForms) {
     VideoFormat format;
     format.nclc = {{6, 1, 6}};
-    EXPECT_EQ(Colors(Parse(format)), (Numbers{6, 1, 6}));
+    EXPECT_EQ(Colors(ParseVideo(format)), (Numbers{6, 1, 6}));
     format.nclc.reset();
     format.nclx = {{9, 16, 9}};
-    EXPECT_EQ(Colors(Parse(format)), (Numbers{9, 16, 9}));
+    EXPECT_EQ(Colors(ParseVideo(format)), (Numbers{9, 16, 9}));
 }
 
 TEST(VideoDescription, HasNoColorsWithoutTheAtomOrWithAProfileOrGammaAlone) {
     VideoFormat format;
-    EXPECT_EQ(Colors(Parse(format)), Numbers());
+    EXPECT_EQ(Colors(ParseVideo(format)), Numbers());
     format.gamma = 2.2;
-    EXPECT_EQ(Colors(Parse(format)), Numbers());
+    EXPECT_EQ(Colors(ParseVideo(format)), Numbers());
     format.extensions = {Box("colr").Code("prof").Zeros(200)};
-    EXPECT_EQ(Colors(Parse(format)), Numbers());
+    EXPECT_EQ(Colors(ParseVideo(format)), Numbers());
     format.extensions = {Box("colr").Code("nclc").U16(1).U16(1).U8(1)};
-    EXPECT_EQ(Colors(Parse(format)), Numbers());
+    EXPECT_EQ(Colors(ParseVideo(format)), Numbers());
 }
 
 TEST(VideoDescription, TakesTheFirstColorsAlsoBehindAProfile) {
@@ -167,7 +167,7 @@ TEST(VideoDescription, TakesTheFirstColorsAlsoBehindAProfile) {
     format.extensions = {Box("colr").Code("prof").Zeros(20)};
     format.nclc = {{1, 1, 1}};
     format.nclx = {{9, 9, 9}};
-    EXPECT_EQ(Colors(Parse(format)), (Numbers{1, 1, 1}));
+    EXPECT_EQ(Colors(ParseVideo(format)), (Numbers{1, 1, 1}));
 }
 
 TEST(VideoDescription, PassesOverOtherExtensionsAndAClosingZero) {
@@ -183,51 +183,51 @@ TEST(VideoDescription, FindsItsExtensionsBehindAColorTable) {
     entry.Zeros(6).U16(1).Zeros(16).U16(320).U16(240).Zeros(14).Zeros(32).U16(2).U16(0);
     entry.U32(0).U16(0).U16(3).Zeros(4 * 8);  // four colours
     entry.Add(Box("colr").Code("nclc").U16(1).U16(2).U16(3));
-    EXPECT_EQ(Colors(Parse(entry)), (Numbers{1, 2, 3}));
+    EXPECT_EQ(Colors(ParseVideo(entry)), (Numbers{1, 2, 3}));
 }
 
 TEST(VideoDescription, StandsWithAColorTableThatDoesNotFit) {
     Box entry("rle ");
     entry.Zeros(6).U16(1).Zeros(16).U16(320).U16(240).Zeros(14).Zeros(32).U16(8).U16(0);
     entry.U32(0).U16(0).U16(0xFFFF).Zeros(16);
-    EXPECT_EQ(Colors(Parse(entry)), Numbers());
+    EXPECT_EQ(Colors(ParseVideo(entry)), Numbers());
 }
 
 TEST(VideoDescription, GivesTheAttributeTexts) {
     VideoFormat format;
-    EXPECT_EQ(Text(Parse(format), &IVideoSampleDescription::GetRIAttributes), "none");
-    EXPECT_EQ(Text(Parse(format), &IVideoSampleDescription::GetCMAttributes), "none");
+    EXPECT_EQ(Text(ParseVideo(format), &IVideoSampleDescription::GetRIAttributes), "none");
+    EXPECT_EQ(Text(ParseVideo(format), &IVideoSampleDescription::GetCMAttributes), "none");
     format.rasterText = "<Bounds>\xC3\xA9</Bounds>";
     format.colorText = std::string("<ColorSpaceDescriptor/>\0behind", 30);
-    EXPECT_EQ(Text(Parse(format), &IVideoSampleDescription::GetRIAttributes),
+    EXPECT_EQ(Text(ParseVideo(format), &IVideoSampleDescription::GetRIAttributes),
               "<Bounds>\xC3\xA9</Bounds>");
-    EXPECT_EQ(Text(Parse(format), &IVideoSampleDescription::GetCMAttributes),
+    EXPECT_EQ(Text(ParseVideo(format), &IVideoSampleDescription::GetCMAttributes),
               "<ColorSpaceDescriptor/>");
     format.rasterText = "";
-    EXPECT_EQ(Text(Parse(format), &IVideoSampleDescription::GetRIAttributes), "");
+    EXPECT_EQ(Text(ParseVideo(format), &IVideoSampleDescription::GetRIAttributes), "");
 }
 
 TEST(VideoDescription, GivesTheResolutionIdWhereThereIsOne) {
     VideoFormat format;
     QTNivoResolution resolution{1, {}};
-    EXPECT_EQ(Parse(format)->GetNivoResolution(&resolution), NCF_E_PARAMETERNOTAVAILABLE);
+    EXPECT_EQ(ParseVideo(format)->GetNivoResolution(&resolution), NCF_E_PARAMETERNOTAVAILABLE);
     EXPECT_EQ(resolution.id, 1u);
     format.resolutionId = 10950;
-    EXPECT_EQ(Parse(format)->GetNivoResolution(&resolution), NCF_OK);
+    EXPECT_EQ(ParseVideo(format)->GetNivoResolution(&resolution), NCF_OK);
     EXPECT_EQ(resolution.id, 10950u);
     format.resolutionId.reset();
     format.extensions = {Box("chRS").Version(1).U32(7)};
-    EXPECT_EQ(Parse(format)->GetNivoResolution(&resolution), NCF_E_PARAMETERNOTAVAILABLE);
+    EXPECT_EQ(ParseVideo(format)->GetNivoResolution(&resolution), NCF_E_PARAMETERNOTAVAILABLE);
     format.extensions = {Box("chRS").Version(0).U16(7)};
-    EXPECT_EQ(Parse(format)->GetNivoResolution(&resolution), NCF_E_PARAMETERNOTAVAILABLE);
+    EXPECT_EQ(ParseVideo(format)->GetNivoResolution(&resolution), NCF_E_PARAMETERNOTAVAILABLE);
 }
 
 TEST(VideoDescription, ListsItsAlphaCodings) {
     VideoFormat format;
     format.codec = "NVj2";
-    EXPECT_EQ(Ask(Parse(format), &IVideoSampleDescription::GetNivoAlphaCodingCount), 0u);
+    EXPECT_EQ(Ask(ParseVideo(format), &IVideoSampleDescription::GetNivoAlphaCodingCount), 0u);
     format.alphaCodings = {{0, 5}};
-    const Description description = Parse(format);
+    const Description description = ParseVideo(format);
     EXPECT_EQ(Ask(description, &IVideoSampleDescription::GetNivoAlphaCodingCount), 2u);
     ncfUInt32 coding = 9;
     EXPECT_EQ(description->GetNivoAlphaCoding(0, &coding), NCF_OK);
@@ -237,11 +237,11 @@ TEST(VideoDescription, ListsItsAlphaCodings) {
     EXPECT_EQ(description->GetNivoAlphaCoding(2, &coding), NCF_E_NOTFOUND);
     format.alphaCodings.reset();
     format.extensions = {Box("chAC").Version(0).U32(3).U32(1).U32(1)};
-    EXPECT_EQ(Ask(Parse(format), &IVideoSampleDescription::GetNivoAlphaCodingCount), 0u);
+    EXPECT_EQ(Ask(ParseVideo(format), &IVideoSampleDescription::GetNivoAlphaCodingCount), 0u);
 }
 
 TEST(VideoDescription, RefusesNullOutputs) {
-    const Description description = Parse(VideoFormat());
+    const Description description = ParseVideo(VideoFormat());
     EXPECT_EQ(description->GetDataFormat(nullptr), NCF_E_POINTER);
     EXPECT_EQ(description->GetEncodedWidthAndHeight(nullptr, nullptr), NCF_E_POINTER);
     EXPECT_EQ(description->HasAlpha(nullptr), NCF_E_POINTER);

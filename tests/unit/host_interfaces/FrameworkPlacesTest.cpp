@@ -18,7 +18,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kFrameworkSlots[] = {
     {"INCFAVBuffer::GetBuffer", 3, SlotOf(&INCFAVBuffer::GetBuffer)},
     {"INCFAVBuffer::GetSampleRange", 4, SlotOf(&INCFAVBuffer::GetSampleRange)},
     {"INCFBuffer::Allocate", 3, SlotOf(&INCFBuffer::Allocate)},
@@ -65,7 +65,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(FrameworkInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kFrameworkSlots);
 }
 
 }  // namespace

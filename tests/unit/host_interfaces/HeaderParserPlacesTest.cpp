@@ -12,7 +12,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kHeaderParserSlots[] = {
     {"IQTParser::GetCreationTime", 3, SlotOf(&IQTParser::GetCreationTime)},
     {"IQTParser::ReservedParser4", 4, SlotOf(&IQTParser::ReservedParser4)},
     {"IQTParser::GetTimeScale", 5, SlotOf(&IQTParser::GetTimeScale)},
@@ -130,7 +130,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(HeaderParserInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kHeaderParserSlots);
 }
 
 }  // namespace

@@ -13,7 +13,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kMediaSlots[] = {
     {"IAAFClips::GetCount", 3, SlotOf(&NMA::IAAFClips::GetCount)},
     {"IAAFClips::GetMetadata", 4, SlotOf(&NMA::IAAFClips::GetMetadata)},
     {"IAAFClips::GetClipPath", 5, SlotOf(&NMA::IAAFClips::GetClipPath)},
@@ -95,7 +95,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(MediaInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kMediaSlots);
 }
 
 }  // namespace

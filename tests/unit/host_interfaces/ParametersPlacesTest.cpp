@@ -12,7 +12,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kParametersSlots[] = {
     {"IParameterSuite::SetComponentId", 3, SlotOf(&IParameterSuite::SetComponentId)},
     {"IParameterSuite::Prepare", 4, SlotOf(&IParameterSuite::Prepare)},
     {"IParameterSuite::WriteXML", 5, SlotOf(&IParameterSuite::WriteXML)},
@@ -46,7 +46,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(ParametersInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kParametersSlots);
 }
 
 }  // namespace

@@ -12,7 +12,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kQuickTimeSlots[] = {
     {"IQuickTimeProperty::CreateMovie", 3, SlotOf(&QuickTime::IQuickTimeProperty::CreateMovie)},
     {"IQuickTimeProperty::GetCodecPixelFormats", 4, SlotOf(&QuickTime::IQuickTimeProperty::GetCodecPixelFormats)},
     {"IQuickTimeProperty::GetCodecName", 5, SlotOf(&QuickTime::IQuickTimeProperty::GetCodecName)},
@@ -73,7 +73,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(QuickTimeInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kQuickTimeSlots);
 }
 
 }  // namespace

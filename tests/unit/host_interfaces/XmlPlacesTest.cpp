@@ -10,7 +10,7 @@
 
 namespace {
 
-const SlotRow kSlots[] = {
+const SlotRow kXmlSlots[] = {
     {"INCFSaxDocumentHandler::Start", 3, SlotOf(&UTIL::INCFSaxDocumentHandler::Start)},
     {"INCFSaxDocumentHandler::End", 4, SlotOf(&UTIL::INCFSaxDocumentHandler::End)},
     {"INCFSaxDocumentHandler::Element", 5, SlotOf(&UTIL::INCFSaxDocumentHandler::Element)},
@@ -47,7 +47,7 @@ const SlotRow kSlots[] = {
 };
 
 TEST(XmlInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kXmlSlots);
 }
 
 }  // namespace

@@ -15,7 +15,7 @@ struct Outcome {
     std::string problem;
 };
 
-Outcome Read(const std::string& xml) {
+Outcome OutcomeOf(const std::string& xml) {
     host::ParameterDocument document;
     document.components.resize(7);
     Outcome outcome;
@@ -30,7 +30,7 @@ Outcome Read(const std::string& xml) {
 }
 
 void ExpectRefusal(const std::string& xml, NCFRESULT result, const std::string& words) {
-    const Outcome outcome = Read(xml);
+    const Outcome outcome = OutcomeOf(xml);
     EXPECT_EQ(outcome.result, result) << xml.substr(0, 200);
     EXPECT_NE(outcome.problem.find(words), std::string::npos) << outcome.problem;
 }
@@ -64,12 +64,12 @@ std::string With(const std::string& part, const std::string& other) {
 }
 
 TEST(ParameterDocumentHostile, TheWholeOneIsFine) {
-    EXPECT_EQ(Read(kWhole).result, NCF_OK);
+    EXPECT_EQ(OutcomeOf(kWhole).result, NCF_OK);
 }
 
 TEST(ParameterDocumentHostile, CutAnywhereItIsRefused) {
     for (std::size_t length = 0; length < kWhole.size(); ++length) {
-        EXPECT_EQ(Read(kWhole.substr(0, length)).result, NCF_E_FAIL) << length;
+        EXPECT_EQ(OutcomeOf(kWhole.substr(0, length)).result, NCF_E_FAIL) << length;
     }
 }
 
@@ -78,7 +78,7 @@ TEST(ParameterDocumentHostile, WithAnyByteOverwrittenItIsTakenOrRefused) {
         for (const char byte : {'\0', '<', '&', '\xFF', '\'', '0'}) {
             std::string xml = kWhole;
             xml[at] = byte;
-            Read(xml);
+            OutcomeOf(xml);
         }
     }
 }
@@ -86,7 +86,7 @@ TEST(ParameterDocumentHostile, WithAnyByteOverwrittenItIsTakenOrRefused) {
 TEST(ParameterDocumentHostile, NothingThatIsNoXmlIsTaken) {
     for (const char* const xml : {"", " ", "hello", "<", "<a", "<a></b>", "<a/><b/>", "<a b=c/>",
                                   "<a>&unknown;</a>", "<a>&#0;</a>", "{\"a\": 1}"}) {
-        EXPECT_EQ(Read(xml).result, NCF_E_FAIL) << xml;
+        EXPECT_EQ(OutcomeOf(xml).result, NCF_E_FAIL) << xml;
     }
     ExpectRefusal("<ncfComponents>\n<component", NCF_E_FAIL, "2:");
 }
@@ -117,11 +117,11 @@ TEST(ParameterDocumentHostile, DeepNestingIsRefused) {
             NCF_E_NOTSUPPORTED, "levels");
     }
     const std::string group = "<parameterGroup id='A1CE72A4-FA19-40E3-9E83-266DAF8AF5BB'>";
-    EXPECT_EQ(
-        Read(With("<version>1.0</version><parameterGroup",
-                  Repeated(group, 240) + Repeated("</parameterGroup>", 240) + "<parameterGroup"))
-            .result,
-        NCF_OK)
+    EXPECT_EQ(OutcomeOf(With("<version>1.0</version><parameterGroup",
+                             Repeated(group, 240) + Repeated("</parameterGroup>", 240) +
+                                 "<parameterGroup"))
+                  .result,
+              NCF_OK)
         << "but what is allowed is walked";
 }
 
@@ -129,12 +129,12 @@ TEST(ParameterDocumentHostile, MoreThanAMegabyteIsRefusedUnread) {
     const std::string filler(host::ParameterLimits::kLargestDocument, ' ');
     ExpectRefusal(filler + kWhole, NCF_E_NOTSUPPORTED, "more than 1 MiB");
     const std::string fits(host::ParameterLimits::kLargestDocument - kWhole.size(), ' ');
-    EXPECT_EQ(Read(kWhole + fits).result, NCF_OK) << "one of exactly that size is taken";
+    EXPECT_EQ(OutcomeOf(kWhole + fits).result, NCF_OK) << "one of exactly that size is taken";
 }
 
 TEST(ParameterDocumentHostile, TextsBeyondTheLimitAreRefused) {
     const std::string limit(host::ParameterLimits::kLongestText, 'n');
-    EXPECT_EQ(Read(With("<name>Name", "<name>" + limit)).result, NCF_OK);
+    EXPECT_EQ(OutcomeOf(With("<name>Name", "<name>" + limit)).result, NCF_OK);
     ExpectRefusal(With("<name>Name", "<name>n" + limit), NCF_E_NOTSUPPORTED, "too long");
     ExpectRefusal(With("<name>Name", "<name>n<!-- -->" + limit), NCF_E_NOTSUPPORTED, "too long");
     ExpectRefusal(With("name='P'", "name='n" + limit + "'"), NCF_E_NOTSUPPORTED, "too long");
@@ -206,7 +206,8 @@ TEST(ParameterDocumentHostile, VersionsThatAreNoneAreRefused) {
                            std::string("<version>") + number + "</version><name>"),
                       NCF_E_INVALIDARG, "no version");
     }
-    EXPECT_EQ(Read(With("</version><name>", "</version><version>x</version><name>")).result, NCF_OK)
+    EXPECT_EQ(OutcomeOf(With("</version><name>", "</version><version>x</version><name>")).result,
+              NCF_OK)
         << "the first one counts";
 }
 
@@ -215,8 +216,8 @@ TEST(ParameterDocumentHostile, BytesThatAreNoUtf8AreRefused) {
     ExpectRefusal(With("<name>Name", "<name>\xED\xA0\x80"), NCF_E_FAIL, "");
     ExpectRefusal(With("<name>Name", "<name>\xC0\x80"), NCF_E_FAIL, "");
     const std::string wide("\xFF\xFE<\0n\0/\0>\0", 10);
-    EXPECT_EQ(Read(wide).result, NCF_E_FAIL) << "UTF-16 bytes";
-    EXPECT_EQ(Read("<?xml version='1.0' encoding='UTF-16'?>" + kWhole).result, NCF_OK)
+    EXPECT_EQ(OutcomeOf(wide).result, NCF_E_FAIL) << "UTF-16 bytes";
+    EXPECT_EQ(OutcomeOf("<?xml version='1.0' encoding='UTF-16'?>" + kWhole).result, NCF_OK)
         << "the text is what it is, whatever it claims";
 }
 

@@ -15,14 +15,14 @@ namespace {
 using host::MakeRef;
 using host::ParameterValue;
 
-constexpr GUID kComponent = ncfGuid("0E74B673-0CA8-403B-A142-986D79508637");
+constexpr GUID kOwner = ncfGuid("0E74B673-0CA8-403B-A142-986D79508637");
 constexpr GUID kSet = ncfGuid("11111111-2222-3333-4444-555555555555");
-constexpr GUID kOtherSet = ncfGuid("22222222-2222-3333-4444-555555555555");
+constexpr GUID kSecondSet = ncfGuid("22222222-2222-3333-4444-555555555555");
 
 class ParameterSuite : public testing::Test {
 protected:
     NCFRESULT Prepare() {
-        const NCFRESULT named = suite->SetComponentId(kComponent);
+        const NCFRESULT named = suite->SetComponentId(kOwner);
         return named < 0 ? named : suite->Prepare(0);
     }
     NCFRESULT Describe() {
@@ -44,7 +44,7 @@ protected:
         std::string problem;
         EXPECT_EQ(host::ReadParameterDocument(Xml(), document, problem), NCF_OK) << problem;
         EXPECT_EQ(document.components.size(), 1u);
-        EXPECT_EQ(document.components.at(0).id, kComponent);
+        EXPECT_EQ(document.components.at(0).id, kOwner);
         EXPECT_EQ(document.components.at(0).tracks.size(), 1u);
         return document.components.at(0).tracks.at(0);
     }
@@ -95,7 +95,7 @@ TEST_F(ParameterSuite, WritesADocumentWithoutADescription) {
 TEST_F(ParameterSuite, PutsTheLastSetIntoUse) {
     ASSERT_EQ(Prepare(), NCF_OK);
     EXPECT_EQ(suite->AddParamSet(kSet, "A", 0, 1.0f, 0), NCF_OK);
-    EXPECT_EQ(suite->AddParamSet(kOtherSet, "B", 0, 1.0f, 0), NCF_OK);
+    EXPECT_EQ(suite->AddParamSet(kSecondSet, "B", 0, 1.0f, 0), NCF_OK);
     const host::ParameterTrack track = Track();
     EXPECT_EQ(track.SetInUse(), &track.sets[1]);
 }
@@ -149,7 +149,7 @@ TEST_F(ParameterSuite, RefusesWhatIsOutOfOrder) {
         EXPECT_EQ(suite->AddParamSet(kSet, "", 0, 1.0f, 0), NCF_E_FAIL);
         expectNoDescription();
         expectNoSet();
-        EXPECT_EQ(suite->SetComponentId(kComponent), NCF_OK);
+        EXPECT_EQ(suite->SetComponentId(kOwner), NCF_OK);
     }
     EXPECT_EQ(suite->Prepare(0), NCF_OK);
     expectNoDescription();

@@ -21,7 +21,7 @@ aafDataBuffer_t BytesOf(aafRational_t& value) {
     return reinterpret_cast<aafDataBuffer_t>(&value);
 }
 
-std::pair<aafInt32, aafInt32> Of(const aafRational_t& rational) {
+std::pair<aafInt32, aafInt32> NumbersOf(const aafRational_t& rational) {
     return {rational.numerator, rational.denominator};
 }
 
@@ -261,7 +261,7 @@ TEST_F(Effect, ConstantValueHasTheTypeOfItsParameter) {
     aafUInt32 bytes = 0;
     EXPECT_EQ(sizeof got, Get(constant, &IAAFConstantValue::GetValueBufLen));
     EXPECT_EQ(AAFRESULT_SUCCESS, constant->GetValue(sizeof got, BytesOf(got), &bytes));
-    EXPECT_EQ(Of(third), Of(got));
+    EXPECT_EQ(NumbersOf(third), NumbersOf(got));
     EXPECT_EQ(sizeof got, bytes);
 }
 
@@ -333,10 +333,10 @@ TEST_F(Effect, VaryingValueKeepsItsPoints) {
     Ptr<IAAFControlPoint> last = Get(varying, &IAAFVaryingValue::GetControlPointAt, aafUInt32{1});
     aafRational_t got{};
     aafUInt32 bytes = 0;
-    EXPECT_EQ(Of({1, 1}), Of(Get(last, &IAAFControlPoint::GetTime)));
+    EXPECT_EQ(NumbersOf({1, 1}), NumbersOf(Get(last, &IAAFControlPoint::GetTime)));
     EXPECT_EQ(kAAFProportional, Get(last, &IAAFControlPoint::GetEditHint));
     EXPECT_EQ(AAFRESULT_SUCCESS, last->GetValue(sizeof got, BytesOf(got), &bytes));
-    EXPECT_EQ(Of({50, 100}), Of(got));
+    EXPECT_EQ(NumbersOf({50, 100}), NumbersOf(got));
     EXPECT_EQ(kAAFTypeID_Rational,
               Get(As<IAAFMetaDefinition>(Get(last, &IAAFControlPoint::GetTypeDefinition)),
                   &IAAFMetaDefinition::GetAUID));

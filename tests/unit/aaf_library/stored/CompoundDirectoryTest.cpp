@@ -6,6 +6,7 @@
 #include "aaf_library/stored/CompoundFileWriter.h"
 #include "aaf_library/stored/LittleEndian.h"
 #include "aaf_library/stored/UpperCase.h"
+#include "tests/unit/aaf_library/stored/CompoundBytes.h"
 
 #include <gtest/gtest.h>
 #include <algorithm>
@@ -15,8 +16,6 @@
 using namespace aaf::stored;
 
 namespace {
-
-constexpr CompoundFileWriter::Storage kRoot = CompoundFileWriter::kRoot;
 
 // The entries of a file, spare ones included.
 class Directory {

@@ -5,6 +5,8 @@
 #include "aaf_library/stored/CompoundFileFormat.h"
 #include "aaf_library/stored/CompoundFileWriter.h"
 #include "aaf_library/stored/StoredError.h"
+#include "tests/unit/aaf_library/stored/CompoundBytes.h"
+#include "tests/unit/aaf_library/stored/Refusal.h"
 
 #include <gtest/gtest.h>
 
@@ -21,11 +23,6 @@ Bytes ThreeStreams() {
     return writer.Finish();
 }
 
-std::uint32_t NumberAt(const Bytes& file, std::size_t at) {
-    return file[at] | file[at + 1] << 8 | file[at + 2] << 16 |
-           static_cast<std::uint32_t>(file[at + 3]) << 24;
-}
-
 void put(Bytes& file, std::size_t at, std::uint32_t value) {
     for (int i = 0; i < 4; ++i) {
         file[at + static_cast<std::size_t>(i)] = static_cast<std::uint8_t>(value >> 8 * i);
@@ -38,18 +35,15 @@ std::size_t EntryAt(const Bytes& file, std::size_t index) {
     return (NumberAt(file, kFirstDirectoryOffset) + 1) * 512 + index * kDirectoryEntrySize;
 }
 
-std::string refusal(const Bytes& file) {
-    try {
+std::string StreamRefusal(const Bytes& file) {
+    return RefusalOf([&] {
         CompoundFileReader reader(file);
         for (const auto& contained : reader.entry(CompoundFileReader::kRootIndex).contained) {
             if (reader.entry(contained.second).kind == CompoundFileReader::Kind::Stream) {
                 reader.Read(contained.second);
             }
         }
-        return "";
-    } catch (const StoredError& problem) {
-        return problem.what();
-    }
+    });
 }
 
 }  // namespace
@@ -76,21 +70,22 @@ TEST(CompoundFileReader, GivesAStreamOutOnce) {
 }
 
 TEST(CompoundFileReader, RefusesOtherKindsOfFiles) {
-    EXPECT_EQ(refusal({}), "is no compound file");
-    EXPECT_EQ(refusal(Bytes(4096)), "is no compound file");
+    EXPECT_EQ(StreamRefusal({}), "is no compound file");
+    EXPECT_EQ(StreamRefusal(Bytes(4096)), "is no compound file");
     Bytes file = ThreeStreams();
     file[kSectorShiftOffset] = 10;
-    EXPECT_EQ(refusal(file), "a kind of compound file that AAF does not use");
+    EXPECT_EQ(StreamRefusal(file), "a kind of compound file that AAF does not use");
     file = ThreeStreams();
     file.resize(512);
-    EXPECT_EQ(refusal(file), "the file ends after its header");
+    EXPECT_EQ(StreamRefusal(file), "the file ends after its header");
 }
 
 TEST(CompoundFileReader, RefusesACircleAmongSiblings) {
     Bytes file = ThreeStreams();
     const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kEntryChildOffset);
     put(file, EntryAt(file, first) + kEntryLeftOffset, first);
-    EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
+    EXPECT_EQ(StreamRefusal(file),
+              "the directory names an entry twice or one that it does not have");
 }
 
 TEST(CompoundFileReader, RefusesAStorageThatContainsTheRoot) {
@@ -100,14 +95,16 @@ TEST(CompoundFileReader, RefusesAStorageThatContainsTheRoot) {
             put(file, EntryAt(file, i) + kEntryChildOffset, 0);
         }
     }
-    EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
+    EXPECT_EQ(StreamRefusal(file),
+              "the directory names an entry twice or one that it does not have");
 }
 
 TEST(CompoundFileReader, RefusesAnEntryBeyondTheDirectory) {
     Bytes file = ThreeStreams();
     const std::uint32_t first = NumberAt(file, EntryAt(file, 0) + kEntryChildOffset);
     put(file, EntryAt(file, first) + kEntryRightOffset, 5000);
-    EXPECT_EQ(refusal(file), "the directory names an entry twice or one that it does not have");
+    EXPECT_EQ(StreamRefusal(file),
+              "the directory names an entry twice or one that it does not have");
 }
 
 TEST(CompoundFileReader, RefusesAChainThatRunsInACircle) {
@@ -115,7 +112,7 @@ TEST(CompoundFileReader, RefusesAChainThatRunsInACircle) {
     const std::uint32_t table = NumberAt(file, kTableListOffset);
     const std::uint32_t directory = NumberAt(file, kFirstDirectoryOffset);
     put(file, (table + 1) * 512 + directory * 4, directory);
-    EXPECT_EQ(refusal(file), "sector " + std::to_string(directory) + " is used twice");
+    EXPECT_EQ(StreamRefusal(file), "sector " + std::to_string(directory) + " is used twice");
 }
 
 TEST(CompoundFileReader, RefusesAStreamThatRunsOutOfTheFile) {
@@ -125,7 +122,7 @@ TEST(CompoundFileReader, RefusesAStreamThatRunsOutOfTheFile) {
             put(file, EntryAt(file, i) + kEntryStartOffset, 4000);
         }
     }
-    EXPECT_EQ(refusal(file), "sector 4000 lies beyond the end of the file");
+    EXPECT_EQ(StreamRefusal(file), "sector 4000 lies beyond the end of the file");
 }
 
 TEST(CompoundFileReader, RefusesAHugeClaimBeforeItTakesMemory) {
@@ -135,10 +132,10 @@ TEST(CompoundFileReader, RefusesAHugeClaimBeforeItTakesMemory) {
             put(file, EntryAt(file, i) + kEntrySizeOffset, 0xFFFFFFF0);
         }
     }
-    EXPECT_EQ(refusal(file), "a stream claims 4294967280 bytes");
+    EXPECT_EQ(StreamRefusal(file), "a stream claims 4294967280 bytes");
     file = ThreeStreams();
     put(file, kTableCountOffset, 0x7FFFFFFF);
-    EXPECT_EQ(refusal(file).find("the header counts 2147483647 table sectors"), 0u);
+    EXPECT_EQ(StreamRefusal(file).find("the header counts 2147483647 table sectors"), 0u);
 }
 
 TEST(CompoundFileReader, RefusesTwoStreamsThatShareASector) {
@@ -151,7 +148,7 @@ TEST(CompoundFileReader, RefusesTwoStreamsThatShareASector) {
             put(file, EntryAt(file, i) + kEntryStartOffset, 0);
         }
     }
-    EXPECT_EQ(refusal(file), "sector 0 is used twice");
+    EXPECT_EQ(StreamRefusal(file), "sector 0 is used twice");
 }
 
 namespace {
@@ -215,7 +212,7 @@ Bytes FileWithTables(std::uint32_t tables) {
 TEST(CompoundFileReader, ReadsAsManyTablesAsTheHeaderCounts) {
     // Those of the header alone; one, all but one and all of a list; two of a second list.
     for (const std::uint32_t tables : {108u, 109u, 110u, 109u + 126u, 109u + 127u, 109u + 129u}) {
-        EXPECT_EQ(refusal(FileWithTables(tables)), "") << tables;
+        EXPECT_EQ(StreamRefusal(FileWithTables(tables)), "") << tables;
     }
 }
 

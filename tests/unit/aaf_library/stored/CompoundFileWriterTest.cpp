@@ -6,6 +6,7 @@
 #include "aaf_library/stored/CompoundFileReader.h"
 #include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/UpperCase.h"
+#include "tests/unit/aaf_library/stored/CompoundBytes.h"
 
 #include <gtest/gtest.h>
 #include <locale.h>
@@ -16,13 +17,6 @@
 using namespace aaf::stored;
 
 namespace {
-
-constexpr CompoundFileWriter::Storage kRoot = CompoundFileWriter::kRoot;
-
-std::uint32_t NumberAt(const Bytes& file, std::size_t at) {
-    return file[at] | file[at + 1] << 8 | file[at + 2] << 16 |
-           static_cast<std::uint32_t>(file[at + 3]) << 24;
-}
 
 Bytes Content(std::size_t size) {
     Bytes content(size);

@@ -6,6 +6,8 @@
 #include "aaf_library/stored/StoredFile.h"
 #include "aaf_library/stored/TreeReader.h"
 #include "aaf_library/stored/TreeWriter.h"
+#include "tests/unit/aaf_library/stored/CompoundBytes.h"
+#include "tests/unit/aaf_library/stored/Refusal.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>
@@ -16,17 +18,11 @@ using namespace aaf::stored;
 
 namespace {
 
-std::string refusal(const Bytes& file) {
-    try {
-        ReadTree(file);
-        return "";
-    } catch (const StoredError& problem) {
-        return problem.what();
-    }
+std::string FileRefusal(const Bytes& file) {
+    return RefusalOf([&] { ReadTree(file); });
 }
 
 using Storage = CompoundFileWriter::Storage;
-constexpr Storage kRoot = CompoundFileWriter::kRoot;
 
 // A file whose root storage holds what the function puts there.
 Bytes FileWith(const std::function<void(CompoundFileWriter&)>& fill) {
@@ -73,7 +69,7 @@ TEST(DamagedFile, IsRefusedHoweverItIsCutShort) {
         for (std::size_t length = 0; length < file.size(); length += 64) {
             const Bytes cut(file.begin(), file.begin() + static_cast<std::ptrdiff_t>(length));
             // A last sector that nothing uses may be missing; all else is felt.
-            const std::string why = refusal(cut);
+            const std::string why = FileRefusal(cut);
             if (why.empty()) {
                 EXPECT_EQ(ReadTree(cut), ReadTree(file)) << length;
                 EXPECT_GE(length, file.size() - static_cast<std::size_t>(size)) << length;
@@ -88,7 +84,7 @@ TEST(DamagedFile, WithAFlippedByteIsReadOrRefusedButNeverHarms) {
     for (std::size_t at = 0; at < file.size(); ++at) {
         Bytes damaged = file;
         damaged[at] ^= at % 2 == 0 ? 0x01 : 0xFF;
-        refused += refusal(damaged).empty() ? 0 : 1;
+        refused += FileRefusal(damaged).empty() ? 0 : 1;
     }
     // Content and padding may change without notice, structure may not.
     EXPECT_GT(refused, file.size() / 20);
@@ -105,27 +101,28 @@ TEST(DamagedFile, WithSeveralRandomBytesIsReadOrRefusedButNeverHarms) {
         for (int i = 0; i < 20; ++i) {
             damaged[random() % damaged.size()] = static_cast<std::uint8_t>(random());
         }
-        refused += refusal(damaged).empty() ? 0 : 1;
+        refused += FileRefusal(damaged).empty() ? 0 : 1;
     }
     EXPECT_GT(refused, 100u);
 }
 
 TEST(DamagedFile, WithoutPropertiesIsRefused) {
-    EXPECT_EQ(refusal(FileWith([](CompoundFileWriter&) {})), "\"properties\" is missing");
+    EXPECT_EQ(FileRefusal(FileWith([](CompoundFileWriter&) {})), "\"properties\" is missing");
 }
 
 TEST(DamagedFile, WithAPropertyTableThatEndsEarlyIsRefused) {
-    EXPECT_EQ(refusal(FileWithProperties({0x4C})), "1 bytes wanted, 0 left");
-    EXPECT_EQ(refusal(FileWithProperties({0x4C, 0x20, 0xFF, 0xFF})), "393210 bytes wanted, 0 left");
+    EXPECT_EQ(FileRefusal(FileWithProperties({0x4C})), "1 bytes wanted, 0 left");
+    EXPECT_EQ(FileRefusal(FileWithProperties({0x4C, 0x20, 0xFF, 0xFF})),
+              "393210 bytes wanted, 0 left");
     Bytes properties = OneProperty(0x4402, 0x82, {1, 2, 3});
     properties.pop_back();
-    EXPECT_EQ(refusal(FileWithProperties(properties)), "property 4402: 3 bytes wanted, 2 left");
+    EXPECT_EQ(FileRefusal(FileWithProperties(properties)), "property 4402: 3 bytes wanted, 2 left");
 }
 
 TEST(DamagedFile, OfTheOtherByteOrderIsRefused) {
-    EXPECT_EQ(refusal(FileWithProperties({0x42, 0x20, 0, 0})),
+    EXPECT_EQ(FileRefusal(FileWithProperties({0x42, 0x20, 0, 0})),
               "big-endian files are not supported");
-    EXPECT_EQ(refusal(FileWithProperties({0x41, 0x20, 0, 0})), "unknown byte order");
+    EXPECT_EQ(FileRefusal(FileWithProperties({0x41, 0x20, 0, 0})), "unknown byte order");
 }
 
 TEST(DamagedFile, APropertyThatComesTwiceCountsOnce) {
@@ -143,14 +140,14 @@ TEST(DamagedFile, WithAPropertyOfNoBytesIsReadWithoutIt) {
 }
 
 TEST(DamagedFile, WithAnObjectMissingIsRefused) {
-    EXPECT_EQ(refusal(FileWithProperties(OneProperty(2, 0x22, name(u"Header-2")))),
+    EXPECT_EQ(FileRefusal(FileWithProperties(OneProperty(2, 0x22, name(u"Header-2")))),
               "property 0002: \"Header-2\" is missing");
 }
 
 TEST(DamagedFile, WithANameThatDoesNotEndIsRefused) {
-    EXPECT_EQ(refusal(FileWithProperties(OneProperty(2, 0x22, {'H', 0}))),
+    EXPECT_EQ(FileRefusal(FileWithProperties(OneProperty(2, 0x22, {'H', 0}))),
               "property 0002: a name that does not end with its terminator");
-    EXPECT_EQ(refusal(FileWithProperties(OneProperty(2, 0x22, {'H', 0, 0}))),
+    EXPECT_EQ(FileRefusal(FileWithProperties(OneProperty(2, 0x22, {'H', 0, 0}))),
               "property 0002: a name of 3 bytes");
 }
 
@@ -167,19 +164,19 @@ TEST(DamagedFile, WithOneObjectInTwoPlacesIsRefused) {
         const Storage slot = writer.AddStorage(kRoot, u"Slots-4403{0}");
         writer.AddStream(slot, u"properties", {0x4C, 0x20, 0, 0});
     });
-    EXPECT_EQ(refusal(file), "property 4403: \"Slots-4403{0}\" is referred to twice");
+    EXPECT_EQ(FileRefusal(file), "property 4403: \"Slots-4403{0}\" is referred to twice");
 }
 
 TEST(DamagedFile, WithAnIndexThatClaimsTooMuchIsRefused) {
     Bytes vector(12, 0xFF);
-    EXPECT_EQ(refusal(FileWithIndex(0x32, vector)),
+    EXPECT_EQ(FileRefusal(FileWithIndex(0x32, vector)),
               "property 1901: the index counts 4294967295 elements, 0 bytes left");
     Bytes set(12, 0xFF);
     set.insert(set.end(), {0x01, 0x44, 32, 0, 0});
-    EXPECT_EQ(refusal(FileWithIndex(0x3A, set)),
+    EXPECT_EQ(FileRefusal(FileWithIndex(0x3A, set)),
               "property 1901: the index counts 4294967295 elements, 2 bytes left");
     set[14] = 0;
-    EXPECT_EQ(refusal(FileWithIndex(0x3A, set)), "property 1901: a key of 0 bytes");
+    EXPECT_EQ(FileRefusal(FileWithIndex(0x3A, set)), "property 1901: a key of 0 bytes");
 }
 
 TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
@@ -199,7 +196,7 @@ TEST(DamagedFile, WithAKeyTwiceInOneSetIsRefused) {
             writer.AddStream(mob, u"properties", {0x4C, 0x20, 0, 0});
         }
     });
-    EXPECT_EQ(refusal(file), "property 1901: a set has a key twice");
+    EXPECT_EQ(FileRefusal(file), "property 1901: a set has a key twice");
 }
 
 TEST(DamagedFile, AWeakReferenceThatMakesNoSenseIsKeptAsItStands) {
@@ -264,10 +261,10 @@ TEST(DamagedFile, WithATableOfWeakReferencesThatLiesIsRefused) {
             writer.AddStream(kRoot, u"referenced properties", table);
         });
     };
-    EXPECT_EQ(refusal(withTable({0x4C, 1, 0, 2, 0, 0, 0, 1, 0, 0, 0})), "");
-    EXPECT_EQ(refusal(withTable({0x4C, 1, 0, 0xFF, 0xFF, 0xFF, 0xFF, 1, 0, 0, 0})),
+    EXPECT_EQ(FileRefusal(withTable({0x4C, 1, 0, 2, 0, 0, 0, 1, 0, 0, 0})), "");
+    EXPECT_EQ(FileRefusal(withTable({0x4C, 1, 0, 0xFF, 0xFF, 0xFF, 0xFF, 1, 0, 0, 0})),
               "the table of weak references ends early");
-    EXPECT_EQ(refusal(withTable({0x4C, 9, 0, 2, 0, 0, 0, 1, 0, 0, 0})),
+    EXPECT_EQ(FileRefusal(withTable({0x4C, 9, 0, 2, 0, 0, 0, 1, 0, 0, 0})),
               "the table of weak references has 1 paths and counts 9");
 }
 
@@ -282,7 +279,7 @@ TEST(DamagedFile, NestedWithoutEndIsRefused) {
     };
     const Bytes file =
         FileWith([&](CompoundFileWriter& writer) { nest(writer, kRoot, kMaximumDepth + 50); });
-    EXPECT_NE(refusal(file).find("objects are nested too deep"), std::string::npos);
+    EXPECT_NE(FileRefusal(file).find("objects are nested too deep"), std::string::npos);
 }
 
 TEST(DamagedFile, StoragesThatNobodyNamesArePassedOver) {
@@ -290,5 +287,5 @@ TEST(DamagedFile, StoragesThatNobodyNamesArePassedOver) {
         writer.AddStream(kRoot, u"properties", {0x4C, 0x20, 0, 0});
         writer.AddStream(kRoot, u"something else", {1, 2, 3});
     });
-    EXPECT_EQ(refusal(file), "");
+    EXPECT_EQ(FileRefusal(file), "");
 }

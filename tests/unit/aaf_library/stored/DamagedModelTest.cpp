@@ -12,6 +12,7 @@
 #include "host_interfaces/aaf/AAFClassIds.h"
 #include "host_interfaces/aaf/AAFDefinitionIds.h"
 #include "host_interfaces/aaf/AAFTypeIds.h"
+#include "tests/unit/aaf_library/stored/Refusal.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
 #include <gtest/gtest.h>
@@ -29,15 +30,10 @@ StoredObject SampleTree() {
     return TreeOfModel(*sample.model, *sample.header);
 }
 
-std::string refusal(const StoredObject& tree) {
+std::string ModelRefusal(const StoredObject& tree) {
     const RefPtr<Model> model = sample::NewModel();
     std::vector<std::string> notes;
-    try {
-        ReadModel(tree, *model, notes);
-        return "";
-    } catch (const StoredError& problem) {
-        return problem.what();
-    }
+    return RefusalOf([&] { ReadModel(tree, *model, notes); });
 }
 
 StoredProperty& property(StoredObject& object, std::uint16_t pid) {
@@ -127,22 +123,22 @@ TEST(DamagedModel, TheSampleItselfIsRead) {
 }
 
 TEST(DamagedModel, WithoutItsMainPartsIsRefused) {
-    EXPECT_EQ(refusal(StoredObject()), "has no meta-dictionary");
+    EXPECT_EQ(ModelRefusal(StoredObject()), "has no meta-dictionary");
     StoredObject tree = SampleTree();
     property(tree, 2).pid = 7;
-    EXPECT_EQ(refusal(tree), "has no header");
+    EXPECT_EQ(ModelRefusal(tree), "has no header");
     tree = SampleTree();
     property(header(tree), prop::Header_Dictionary.pid).pid = 0x7001;
-    EXPECT_EQ(refusal(tree), "has no dictionary");
+    EXPECT_EQ(ModelRefusal(tree), "has no dictionary");
     tree = SampleTree();
     property(header(tree), prop::Header_Content.pid).pid = 0x7001;
-    EXPECT_EQ(refusal(tree), "has no content");
+    EXPECT_EQ(ModelRefusal(tree), "has no content");
 }
 
 TEST(DamagedModel, WithAHeaderOfAnotherClassIsRefused) {
     StoredObject tree = SampleTree();
     header(tree).classId = AuidOf(AUID_AAFFiller);
-    EXPECT_EQ(refusal(tree), "an object of the class Filler in a place for others");
+    EXPECT_EQ(ModelRefusal(tree), "an object of the class Filler in a place for others");
 }
 
 TEST(DamagedModel, AnObjectThatDoesNotFitIsKeptWithAllThatStandsBesideIt) {
@@ -387,7 +383,7 @@ TEST(DamagedModel, TypesThatAreMadeOfThemselvesAreLeftOut) {
     StoredProperty& set = types(tree);
     set.objects.insert(set.objects.end(), added.objects.begin(), added.objects.end());
     set.keys.insert(set.keys.end(), added.keys.begin(), added.keys.end());
-    EXPECT_EQ(refusal(tree), "");
+    EXPECT_EQ(ModelRefusal(tree), "");
 }
 
 TEST(DamagedModel, ALongLineOfTypesIsRefused) {
@@ -408,7 +404,7 @@ TEST(DamagedModel, ALongLineOfTypesIsRefused) {
     StoredProperty& set = types(tree);
     set.objects.insert(set.objects.end(), added.objects.begin(), added.objects.end());
     set.keys.insert(set.keys.end(), added.keys.begin(), added.keys.end());
-    EXPECT_EQ(refusal(tree), "definitions that are made of one another without end");
+    EXPECT_EQ(ModelRefusal(tree), "definitions that are made of one another without end");
 }
 
 TEST(DamagedModel, AnArrayTypeLargerThanAnyValueIsLeftOut) {

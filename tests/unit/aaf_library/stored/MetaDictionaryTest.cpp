@@ -6,6 +6,7 @@
 #include "aaf_library/stored/TreeReader.h"
 #include "aaf_library/stored/TreeWriter.h"
 #include "tests/unit/aaf_library/stored/BuiltInRecords.h"
+#include "tests/unit/aaf_library/stored/Refusal.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>
@@ -45,13 +46,8 @@ void SortById(MetaRecords& records) {
     }
 }
 
-std::string refusal(const StoredObject& dictionary) {
-    try {
-        ReadMetaDictionary(dictionary);
-        return "";
-    } catch (const StoredError& problem) {
-        return problem.what();
-    }
+std::string DictionaryRefusal(const StoredObject& dictionary) {
+    return RefusalOf([&] { ReadMetaDictionary(dictionary); });
 }
 
 // Why the only type is left out.
@@ -221,5 +217,5 @@ TEST(MetaDictionary, OnlyTheOddPropertyOfAClassIsLeftOut) {
 }
 
 TEST(MetaDictionary, WithoutItsSetsItIsRefused) {
-    EXPECT_EQ(refusal(StoredObject()), "meta-dictionary: property 0003 is missing");
+    EXPECT_EQ(DictionaryRefusal(StoredObject()), "meta-dictionary: property 0003 is missing");
 }

@@ -20,6 +20,7 @@
 #include "host_interfaces/aaf/AAFTypeIds.h"
 #include "tests/support/TestFolder.h"
 #include "tests/unit/aaf_library/stored/BuiltInRecords.h"
+#include "tests/unit/aaf_library/stored/Refusal.h"
 #include "tests/unit/aaf_library/stored/SampleModel.h"
 
 #include <gtest/gtest.h>
@@ -54,13 +55,8 @@ const StoredObject& child(const StoredObject& object, std::uint16_t pid, std::si
     return property->objects[index];
 }
 
-std::string refusal(const sample::SampleModel& sample) {
-    try {
-        TreeOfModel(*sample.model, *sample.header);
-        return "";
-    } catch (const StoredError& problem) {
-        return problem.what();
-    }
+std::string WritingRefusal(const sample::SampleModel& sample) {
+    return RefusalOf([&] { TreeOfModel(*sample.model, *sample.header); });
 }
 
 std::set<std::wstring> StoredClasses(const StoredObject& root) {
@@ -188,17 +184,9 @@ TEST(ModelFile, ADefinitionThatIsTooLongIsToldWithItsPlace) {
         id.Data1 = static_cast<std::uint32_t>(i);
         type.AppendElement(id, (L"Usage_of_quite_a_long_name_" + std::to_wstring(i)).c_str());
     }
-    const auto refusal = [&](const auto& save) -> std::string {
-        try {
-            save(sample);
-        } catch (const StoredError& error) {
-            return error.what();
-        }
-        return "";
-    };
-    const std::string whole = refusal([](const auto& model) { BytesOf(model); });
+    const std::string whole = RefusalOf([&] { BytesOf(sample); });
     EXPECT_EQ(whole.find("MetaDictionary-1: TypeDefinitions-4{"), 0u) << whole;
-    EXPECT_EQ(refusal([](const auto& model) { BytesToSave(model); }), whole);
+    EXPECT_EQ(RefusalOf([&] { BytesToSave(sample); }), whole);
 }
 
 TEST(ModelFile, EverythingComesBackFromTheFile) {
@@ -442,13 +430,13 @@ TEST(ModelFile, ASlotWithoutSegmentIsRefused) {
     const sample::SampleModel sample = sample::WholeModel();
     Object& slot = sample::slot(sample::mob(*sample.header, 0), 0);
     ASSERT_GE(slot.RemoveValue(prop::MobSlot_Segment), 0);
-    EXPECT_EQ(refusal(sample), "Content: Mobs: Slots: TimelineMobSlot has no Segment");
+    EXPECT_EQ(WritingRefusal(sample), "Content: Mobs: Slots: TimelineMobSlot has no Segment");
 }
 
 TEST(ModelFile, ASourceMobWithoutDescriptorIsRefused) {
     const sample::SampleModel sample = sample::WholeModel();
     ASSERT_GE(sample::mob(*sample.header, 0).RemoveValue(prop::SourceMob_EssenceDescription), 0);
-    EXPECT_EQ(refusal(sample), "Content: Mobs: SourceMob has no EssenceDescription");
+    EXPECT_EQ(WritingRefusal(sample), "Content: Mobs: SourceMob has no EssenceDescription");
 }
 
 TEST(ModelFile, ADefinitionThatTheDictionaryLacksIsRefused) {
@@ -456,7 +444,7 @@ TEST(ModelFile, ADefinitionThatTheDictionaryLacksIsRefused) {
     Object& import = sample::mob(*sample.header, 1);
     Object* timecode = sample::slot(import, 0).ObjectAt(prop::MobSlot_Segment);
     timecode->FindValue(prop::Component_DataDefinition)->BytesToChange()[0] ^= 0xFF;
-    EXPECT_EQ(refusal(sample),
+    EXPECT_EQ(WritingRefusal(sample),
               "a definition that is referred to is not in the dictionary (property 2605)");
 }
 
@@ -467,7 +455,7 @@ TEST(ModelFile, ABuiltInDefinitionThatNobodyLookedUpIsStoredWhereItIsReferredTo)
     Bytes& target = timecode->FindValue(prop::Component_DataDefinition)->BytesToChange();
     const StoredAuid edgecode = AuidOf(kAAFDataDef_Edgecode);
     target.assign(edgecode.begin(), edgecode.end());
-    EXPECT_EQ(refusal(sample), "");
+    EXPECT_EQ(WritingRefusal(sample), "");
     const StoredObject tree = TreeOfModel(*sample.model, *sample.header);
     const StoredObject& dictionary = child(child(tree, 2), prop::Header_Dictionary.pid);
     const std::vector<Bytes>& keys = dictionary.Find(prop::Dictionary_DataDefinitions.pid)->keys;

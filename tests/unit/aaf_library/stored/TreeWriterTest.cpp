@@ -5,6 +5,7 @@
 #include "aaf_library/stored/CompoundFileReader.h"
 #include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/StoredFile.h"
+#include "tests/unit/aaf_library/stored/Refusal.h"
 #include "tests/unit/aaf_library/stored/SampleTree.h"
 
 #include <gtest/gtest.h>
@@ -27,13 +28,8 @@ Bytes StreamOf(const Bytes& file, const std::vector<std::u16string>& path) {
     return reader.Read(at);
 }
 
-std::string refusal(const StoredObject& tree) {
-    try {
-        WriteTree(tree, SectorSize::Bytes512);
-        return "";
-    } catch (const StoredError& problem) {
-        return problem.what();
-    }
+std::string TreeRefusal(const StoredObject& tree) {
+    return RefusalOf([&] { WriteTree(tree, SectorSize::Bytes512); });
 }
 
 }  // namespace
@@ -89,16 +85,16 @@ TEST(TreeWriter, LaysOutTheIndexOfASet) {
 TEST(TreeWriter, RefusesAPropertyThatOccursTwice) {
     StoredObject tree = sample::RootWith(sample::data(0x4402, {1}));
     tree.properties.push_back(sample::data(0x4402, {2}));
-    EXPECT_EQ(refusal(tree), "property 4402: occurs twice in one object");
+    EXPECT_EQ(TreeRefusal(tree), "property 4402: occurs twice in one object");
 }
 
 TEST(TreeWriter, RefusesAValueThatDoesNotFitItsSizeField) {
-    EXPECT_EQ(refusal(sample::RootWith(sample::data(0x4402, Bytes(65536)))),
+    EXPECT_EQ(TreeRefusal(sample::RootWith(sample::data(0x4402, Bytes(65536)))),
               "property 4402: 65536 bytes, a value may take 65535");
 }
 
 TEST(TreeWriter, RefusesEqualKeysInASet) {
-    EXPECT_EQ(refusal(sample::RootWith(
+    EXPECT_EQ(TreeRefusal(sample::RootWith(
                   sample::set(0x1901, u"Mobs", {sample::keyed(1), sample::keyed(1)}))),
               "property 1901: two elements of a set have the same key");
 }
@@ -106,19 +102,20 @@ TEST(TreeWriter, RefusesEqualKeysInASet) {
 TEST(TreeWriter, RefusesAnElementThatDoesNotStoreItsKey) {
     StoredProperty set = sample::set(0x1901, u"Mobs", {sample::keyed(1)});
     set.objects[0].properties.clear();
-    EXPECT_EQ(refusal(sample::RootWith(set)), "property 1901: an element does not store its key");
+    EXPECT_EQ(TreeRefusal(sample::RootWith(set)),
+              "property 1901: an element does not store its key");
 }
 
 TEST(TreeWriter, RefusesKeysAndObjectsThatDoNotPair) {
     StoredProperty set = sample::set(0x1901, u"Mobs", {sample::keyed(1)});
     set.keys.clear();
-    EXPECT_EQ(refusal(sample::RootWith(set)), "property 1901: a set has 1 elements and 0 keys");
+    EXPECT_EQ(TreeRefusal(sample::RootWith(set)), "property 1901: a set has 1 elements and 0 keys");
 }
 
 TEST(TreeWriter, RefusesAReferenceWithoutObject) {
     StoredProperty property = sample::reference(0x4803, u"Segment", {});
     property.objects.clear();
-    EXPECT_EQ(refusal(sample::RootWith(property)),
+    EXPECT_EQ(TreeRefusal(sample::RootWith(property)),
               "property 4803: a strong reference holds one object, not 0");
 }
 
@@ -126,21 +123,21 @@ TEST(TreeWriter, RefusesAWeakReferenceThatLeadsNowhere) {
     StoredProperty property;
     property.pid = 0x0201;
     property.form = StoredForm::WeakReference;
-    EXPECT_EQ(refusal(sample::RootWith(property)),
+    EXPECT_EQ(TreeRefusal(sample::RootWith(property)),
               "property 0201: a weak reference has one key, not 0");
     property.keys = {sample::bytes(sample::auid(1))};
-    EXPECT_EQ(refusal(sample::RootWith(property)),
+    EXPECT_EQ(TreeRefusal(sample::RootWith(property)),
               "property 0201: a weak reference without a path to its targets");
     property.targetPath = {2, 0, 3};
-    EXPECT_EQ(refusal(sample::RootWith(property)),
+    EXPECT_EQ(TreeRefusal(sample::RootWith(property)),
               "property 0201: a weak reference without a path to its targets");
     property.targetPath = {2, 3};
     property.keys = {Bytes(15)};
-    EXPECT_EQ(refusal(sample::RootWith(property)), "property 0201: a key of 15 bytes");
+    EXPECT_EQ(TreeRefusal(sample::RootWith(property)), "property 0201: a key of 15 bytes");
 }
 
 TEST(TreeWriter, RefusesNamesThatACompoundFileCannotHold) {
-    EXPECT_EQ(refusal(sample::RootWith(sample::reference(0x4803, u"a/b", {}))),
+    EXPECT_EQ(TreeRefusal(sample::RootWith(sample::reference(0x4803, u"a/b", {}))),
               "\"a/b-4803\" cannot be the name of a storage or stream");
 }
 
@@ -149,15 +146,16 @@ TEST(TreeWriter, RefusesNestingWithoutEnd) {
     for (int i = 0; i < kMaximumDepth; ++i) {
         tree = sample::RootWith(sample::reference(0x4803, u"Segment", tree));
     }
-    EXPECT_EQ(refusal(tree), "");
+    EXPECT_EQ(TreeRefusal(tree), "");
     tree = sample::RootWith(sample::reference(0x4803, u"Segment", tree));
-    EXPECT_NE(refusal(tree).find("objects are nested too deep"), std::string::npos);
+    EXPECT_NE(TreeRefusal(tree).find("objects are nested too deep"), std::string::npos);
 }
 
 TEST(TreeWriter, NamesThePlaceOfADeepDefect) {
     StoredObject inner = sample::RootWith(sample::data(0x5001, Bytes(70000)));
     const StoredObject tree = sample::RootWith(sample::vector(0x4403, u"Slots", {{}, inner}));
-    EXPECT_EQ(refusal(tree), "Slots-4403{1}: property 5001: 70000 bytes, a value may take 65535");
+    EXPECT_EQ(TreeRefusal(tree),
+              "Slots-4403{1}: property 5001: 70000 bytes, a value may take 65535");
 }
 
 TEST(TreeWriter, AnObjectLaidOutBeforeGivesTheSameBytes) {
@@ -208,5 +206,5 @@ TEST(TreeWriter, RefusesAnObjectThatWasLaidOutForOtherTargets) {
     StoredObject known;
     known.laidOut = LayOut({}, {{4, 5}});
     root.properties.push_back(sample::reference(0x4803, u"Segment", known));
-    EXPECT_EQ(refusal(root), "an object was laid out for another table of targets");
+    EXPECT_EQ(TreeRefusal(root), "an object was laid out for another table of targets");
 }

@@ -15,7 +15,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kDefinitionSlots[] = {
     // AAFDictionary.h
     {"IAAFDictionary::CreateInstance", 3, SlotOf(&IAAFDictionary::CreateInstance)},
     {"IAAFDictionary::CreateMetaInstance", 4, SlotOf(&IAAFDictionary::CreateMetaInstance)},
@@ -526,7 +526,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(AAFDefinitionInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kDefinitionSlots);
 }
 
 }  // namespace

@@ -12,7 +12,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kDescriptorSlots[] = {
     // AAFDescriptors.h
     {"IAAFAuxiliaryDescriptor::Initialize", 3, SlotOf(&IAAFAuxiliaryDescriptor::Initialize)},
     {"IAAFAuxiliaryDescriptor::SetMimeType", 4, SlotOf(&IAAFAuxiliaryDescriptor::SetMimeType)},
@@ -380,7 +380,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(AAFDescriptorInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kDescriptorSlots);
 }
 
 }  // namespace

@@ -11,7 +11,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kFileAndEssenceSlots[] = {
     // AAFFile.h
     {"IAAFCachePageAllocator::Initialize", 3, SlotOf(&IAAFCachePageAllocator::Initialize)},
     {"IAAFCachePageAllocator::Allocate", 4, SlotOf(&IAAFCachePageAllocator::Allocate)},
@@ -310,7 +310,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(AAFFileAndEssenceInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kFileAndEssenceSlots);
 }
 
 }  // namespace

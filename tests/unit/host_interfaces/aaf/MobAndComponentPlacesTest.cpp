@@ -15,7 +15,7 @@
 namespace {
 
 // clang-format off
-const SlotRow kSlots[] = {
+const SlotRow kMobAndComponentSlots[] = {
     // AAFMobs.h
     {"IAAFCompositionMob::Initialize", 3, SlotOf(&IAAFCompositionMob::Initialize)},
     {"IAAFCompositionMob::GetDefaultFade", 4, SlotOf(&IAAFCompositionMob::GetDefaultFade)},
@@ -411,7 +411,7 @@ const SlotRow kSlots[] = {
 // clang-format on
 
 TEST(AAFMobAndComponentInterfaces, HaveTheirOperationsInTheirPlaces) {
-    ExpectPublishedPlaces(kSlots);
+    ExpectPublishedPlaces(kMobAndComponentSlots);
 }
 
 }  // namespace
