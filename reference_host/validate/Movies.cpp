@@ -40,6 +40,12 @@ std::error_code LastError() {
     return {errno != 0 ? errno : EIO, std::generic_category()};
 }
 
+// Not every file system takes every name.
+bool IsAboutTheName(const std::error_code& error) {
+    constexpr int kNumbers[] = {EINVAL, EILSEQ, ENAMETOOLONG, ENOENT};
+    return std::find(std::begin(kNumbers), std::end(kNumbers), error.value()) != std::end(kNumbers);
+}
+
 SampleMovie Write(const Movie& movie, const std::filesystem::path& file, const char* about) {
     errno = 0;
     if (!movies::Build(movie).WriteTo(file)) {
@@ -193,9 +199,13 @@ std::vector<SampleMovie> WriteOddlyNamedMovies(const std::filesystem::path& fold
     };
     std::vector<SampleMovie> written;
     for (const std::string& name : names) {
-        const std::filesystem::path file = folder / host::system::PathOfText(name);
-        if (host::system::NameProblem(file).empty()) {
-            written.push_back(Write(WholeMovie(), file, "a sound movie under an odd name"));
+        try {
+            written.push_back(Write(WholeMovie(), folder / host::system::PathOfText(name),
+                                    "a sound movie under an odd name"));
+        } catch (const CannotWrite& refused) {
+            if (!IsAboutTheName(refused.error)) {
+                throw;
+            }
         }
     }
     return written;

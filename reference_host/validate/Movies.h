@@ -32,7 +32,7 @@ std::vector<SampleMovie> WriteBrokenMovies(const std::filesystem::path& folder);
 std::vector<SampleMovie> WriteHostileMovies(const std::filesystem::path& folder);
 // Movies beyond what 32 bits count; nearly all of it are holes that take no room.
 std::vector<SampleMovie> WriteHugeMovies(const std::filesystem::path& folder);
-// Sound movies under names that few programs expect.
+// Sound movies under names that few programs expect, but for those that the file system refuses.
 std::vector<SampleMovie> WriteOddlyNamedMovies(const std::filesystem::path& folder);
 
 // The bytes with a few changes that the numbers choose.

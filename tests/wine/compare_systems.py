@@ -61,11 +61,15 @@ class Windows(Linux):
         self.home = r"C:\médiâ tools"
         self.program = [self.wine, self.home + r"\cliphost.exe"]
         self.folder = work / "windows"
+        # While a program runs, Wine's services stay; they would start and stop for each call, and some break at it.
+        self.waiting = subprocess.Popen([self.wine, "cmd"], env=self.environment, stdin=subprocess.PIPE,
+                                        stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
 
     def path(self, path):
         return "Z:" + str(path).replace("/", "\\")
 
     def stop(self):
+        self.waiting.communicate()
         server = shutil.which("wineserver") or "/usr/lib/wine/wineserver64"
         subprocess.run([server, "-k"], env=self.environment, check=False)
 
