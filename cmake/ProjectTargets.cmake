@@ -32,6 +32,10 @@ endif()
 # takes a third of the time; file by file, the next build after an edit is the shorter.
 option(CLIPHOST_BATCHES "Compile the files of a library in batches" OFF)
 set(CMAKE_UNITY_BUILD_BATCH_SIZE 8)
+# It spends a seventh of its time on collecting garbage, unless it may have so many kilobytes of it.
+if(CLIPHOST_BATCHES AND CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
+  add_compile_options(--param=ggc-min-heapsize=524288)
+endif()
 
 add_library(project_options INTERFACE)
 target_include_directories(project_options INTERFACE ${PROJECT_SOURCE_DIR})

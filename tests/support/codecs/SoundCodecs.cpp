@@ -16,7 +16,7 @@ constexpr const char* kMpegRates = "48000 44100 22050";
 constexpr const char* kOwnNoise = "-cons_noisegen 1";
 constexpr const char* kInFloats = "-c:a mp2float";
 
-// Lists are words with a space between. Tested always are the first of each
+// Lists are words with a space between. The broad set has the first of each
 // list together, and the second of each.
 struct SoundCodec {
     const char* name;

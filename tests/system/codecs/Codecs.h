@@ -6,13 +6,16 @@
 #include <string>
 #include <vector>
 
+// When a movie is tested: at every run, by CI, or by thorough runs alone.
+enum class TestSet { kAlways, kBroad, kThorough };
+
 // A short movie to be made by FFmpeg.
 struct CodecCase {
-    std::string name;      // of the test
-    std::string source;    // what is encoded, as a filter graph
-    std::string options;   // of the encoder
-    std::string ending;    // of the file
-    bool isBrief = false;  // tested always
+    std::string name;     // of the test
+    std::string source;   // what is encoded, as a filter graph
+    std::string options;  // of the encoder
+    std::string ending;   // of the file
+    TestSet set = TestSet::kThorough;
     // Copies the packets into a second movie, with these options before and
     // behind its input; not done when both are empty.
     std::string copyBefore;

@@ -105,11 +105,11 @@ TEST_P(SoundCodecs, AreReadAsFfmpegReadsThem) {
     }
 }
 
-std::vector<CodecCase> Only(const std::vector<CodecCase>& cases, bool isBrief) {
+auto Only(const std::vector<CodecCase>& cases, TestSet set) {
     std::vector<CodecCase> chosen;
     std::copy_if(cases.begin(), cases.end(), std::back_inserter(chosen),
-                 [isBrief](const CodecCase& each) { return each.isBrief == isBrief; });
-    return chosen;
+                 [set](const CodecCase& each) { return each.set == set; });
+    return testing::ValuesIn(chosen);
 }
 
 std::string NameOf(const testing::TestParamInfo<CodecCase>& info) {
@@ -119,13 +119,15 @@ std::string NameOf(const testing::TestParamInfo<CodecCase>& info) {
     return name;
 }
 
-INSTANTIATE_TEST_SUITE_P(Brief, PictureCodecs, testing::ValuesIn(Only(PictureCodecCases(), true)),
+// The names tell which runs test them.
+INSTANTIATE_TEST_SUITE_P(Always, PictureCodecs, Only(PictureCodecCases(), TestSet::kAlways),
                          NameOf);
-INSTANTIATE_TEST_SUITE_P(Thorough, PictureCodecs,
-                         testing::ValuesIn(Only(PictureCodecCases(), false)), NameOf);
-INSTANTIATE_TEST_SUITE_P(Brief, SoundCodecs, testing::ValuesIn(Only(SoundCodecCases(), true)),
+INSTANTIATE_TEST_SUITE_P(Broad, PictureCodecs, Only(PictureCodecCases(), TestSet::kBroad), NameOf);
+INSTANTIATE_TEST_SUITE_P(Thorough, PictureCodecs, Only(PictureCodecCases(), TestSet::kThorough),
                          NameOf);
-INSTANTIATE_TEST_SUITE_P(Thorough, SoundCodecs, testing::ValuesIn(Only(SoundCodecCases(), false)),
+INSTANTIATE_TEST_SUITE_P(Always, SoundCodecs, Only(SoundCodecCases(), TestSet::kAlways), NameOf);
+INSTANTIATE_TEST_SUITE_P(Broad, SoundCodecs, Only(SoundCodecCases(), TestSet::kBroad), NameOf);
+INSTANTIATE_TEST_SUITE_P(Thorough, SoundCodecs, Only(SoundCodecCases(), TestSet::kThorough),
                          NameOf);
 
 }  // namespace

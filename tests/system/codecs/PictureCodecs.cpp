@@ -10,7 +10,7 @@ namespace {
 
 constexpr const char* kSmall = "160x96";
 
-// Lists are words with a space between. Tested always are the first pixel formats
+// Lists are words with a space between. The broad set has the first pixel formats
 // in the first ending.
 struct PictureCodec {
     const char* name;
@@ -18,7 +18,7 @@ struct PictureCodec {
     const char* pixels;
     const char* endings;
     const char* size = kSmall;
-    std::size_t always = 1;
+    std::size_t broad = 1;
 };
 
 // Left out is what ffmpeg writes but does not read again: raw planes, and 4:4:0
@@ -221,14 +221,16 @@ std::vector<CodecCase> PictureCodecCases() {
                 cases.push_back({std::string(codec.name) + "_" + pixels + "_" + endings[e],
                                  Source(codec.size, pixels),
                                  std::string(codec.options) + " -pix_fmt " + pixels, endings[e],
-                                 e == 0 && p < codec.always, "", "", "", true});
+                                 e == 0 && p < codec.broad ? TestSet::kBroad : TestSet::kThorough,
+                                 "", "", "", true});
             }
         }
     }
     for (const PictureFeature& feature : kPictureFeatures) {
         cases.push_back({feature.name, Source("160x96", feature.pixels),
                          std::string(feature.options) + " -pix_fmt " + feature.pixels,
-                         feature.ending, true, feature.copyBefore, feature.copyBehind, "", true});
+                         feature.ending, TestSet::kAlways, feature.copyBefore, feature.copyBehind,
+                         "", true});
     }
     return cases;
 }

@@ -44,12 +44,12 @@ std::vector<CodecCase> SoundCodecCases() {
     std::vector<CodecCase> cases;
     for (const SoundCase& codec : SoundCases()) {
         cases.push_back({codec.name, SoundSource(codec.rate, codec.layout, kSeconds), codec.encoder,
-                         codec.ending, codec.isBrief, "", "", codec.reading,
-                         codec.isExactAnywhere});
+                         codec.ending, codec.isBroad ? TestSet::kBroad : TestSet::kThorough, "", "",
+                         codec.reading, codec.isExactAnywhere});
     }
     for (const SoundFeature& feature : kSoundFeatures) {
         cases.push_back({feature.name, SoundSource(feature.rate, "stereo", kSeconds),
-                         feature.encoder, feature.ending, true, feature.copyBefore,
+                         feature.encoder, feature.ending, TestSet::kAlways, feature.copyBefore,
                          feature.copyBehind});
     }
     return cases;

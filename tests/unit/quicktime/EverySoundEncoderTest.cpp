@@ -90,14 +90,14 @@ TEST_P(EverySoundEncoder, GivesAnyRangeAloneAsInTheWhole) {
     }
 }
 
-std::vector<SoundCase> Brief() {
-    std::vector<SoundCase> brief;
-    std::copy_if(SoundCases().begin(), SoundCases().end(), std::back_inserter(brief),
-                 [](const SoundCase& row) { return row.isBrief; });
-    return brief;
+std::vector<SoundCase> BroadCases() {
+    std::vector<SoundCase> broad;
+    std::copy_if(SoundCases().begin(), SoundCases().end(), std::back_inserter(broad),
+                 [](const SoundCase& row) { return row.isBroad; });
+    return broad;
 }
 
-INSTANTIATE_TEST_SUITE_P(AudioReader, EverySoundEncoder, testing::ValuesIn(Brief()),
+INSTANTIATE_TEST_SUITE_P(Broad, EverySoundEncoder, testing::ValuesIn(BroadCases()),
                          [](const auto& row) {
                              std::string name = row.param.name;
                              std::replace(name.begin(), name.end(), '.', '_');
