@@ -433,6 +433,39 @@ TEST_F(Validates, EachComponentOfTheModule) {
     EXPECT_NE(check.value("done", "").find("component 1 "), std::string::npos) << check.dump(2);
 }
 
+TEST_F(Validates, EachContainerAndEachVolumeThatClaimsMovies) {
+    struct Wrong {
+        const char* fault;
+        const char* id;
+        const char* done;
+    };
+    for (const Wrong& wrong :
+         {Wrong{"last-container", "container-describes",
+                "component 6, Last container: describing a sound movie"},
+          Wrong{"last-volume", "volume-format",
+                "component 5, Last volume: listing the clips of a folder of movies"}}) {
+        SCOPED_TRACE(wrong.fault);
+        setenv("CLIPHOST_FAULT", wrong.fault, 1);
+        const Answer answer = Validate(Faulty("FaultyModule"), std::string("--only ") + wrong.id);
+        EXPECT_EQ(answer.status, 1);
+        const json check = answer.Of(wrong.id);
+        EXPECT_EQ(check["verdict"], "failed");
+        EXPECT_EQ(check.value("done", "").rfind(wrong.done, 0), 0u) << check.dump(2);
+    }
+}
+
+TEST_F(Validates, AContainerWhereAnotherOneSkipsTheCheck) {
+    setenv("CLIPHOST_FAULT", "last-container", 1);  // it describes nothing, so it skips that
+    const Answer answer = Validate(Faulty("FaultyModule"), "--only description-slots");
+    EXPECT_EQ(answer.Of("description-slots")["verdict"], "passed");
+    setenv("CLIPHOST_FAULT", "container-describes", 1);  // no other one claims movies
+    const json skipped =
+        Validate(Faulty("FaultyModule"), "--only description-slots").Of("description-slots");
+    EXPECT_EQ(skipped["verdict"], "skipped");
+    EXPECT_EQ(skipped.value("found", "").rfind("the module does not describe a sound movie", 0),
+              0u);
+}
+
 TEST_F(Validates, AndWarnsWhereCallsHaveNoEnd) {
     setenv("CLIPHOST_FAULT", "attributes-without-end", 1);
     const Answer answer = Validate(Faulty("FaultyModule"), "--only refusal-definition-calls");
