@@ -45,6 +45,7 @@ void ObjectsLeaveNothing(Trial& trial) {
         ExpectNothingLeft(trial, "making and releasing an object of " + made.name, [&] {
             void* out = nullptr;
             const auto factory = FactoryOf(module, made.component);
+            trial.Expect(static_cast<bool>(factory), "a class factory, as before", "none");
             factory->CreateInstance(module.unknown(), nullptr, IID_INCFUnknown, &out);
             const auto object = host::Ref<INCFUnknown>::Adopt(static_cast<INCFUnknown*>(out));
             if (object) {

@@ -18,11 +18,6 @@ host::Ref<NMA::ISampleMapping> MappingOf(Trial& trial, NMA::IMediaContainer3* co
     return mapping;
 }
 
-host::Ref<NMA::ISampleMapping> MappingOf(Containers& containers,
-                                         const std::filesystem::path& movie) {
-    return MappingOf(containers.trial(), containers.Open(movie).get());
-}
-
 // A module that counts wrongly has another check against it.
 ncfUInt32 TracksOf(NMA::ISampleMapping& mapping) {
     return static_cast<ncfUInt32>(std::max<ncfSInt32>(mapping.GetNumberOfTracks(), 0));
@@ -47,7 +42,8 @@ void ForEachTrack(Containers& containers,
                                            std::uintmax_t fileSize)>& visit) {
     Trial& trial = containers.trial();
     const SampleMovie movie = WriteSoundMovie(containers.folder());
-    const auto mapping = MappingOf(containers, movie.file);
+    const auto container = containers.Open(movie.file);
+    const auto mapping = MappingOf(trial, container.get());
     const ncfUInt32 tracks = TracksOf(*mapping);
     bool isAny = false;
     for (ncfUInt32 track = 0; track < tracks; ++track) {
@@ -63,7 +59,8 @@ void ForEachTrack(Containers& containers,
 
 void HasTracks(Containers& containers) {
     Trial& trial = containers.trial();
-    const auto mapping = MappingOf(containers, WriteSoundMovie(containers.folder()).file);
+    const auto container = containers.Open(WriteSoundMovie(containers.folder()).file);
+    const auto mapping = MappingOf(trial, container.get());
     trial.Doing("calling GetNumberOfTracks for a movie with picture and sound");
     const ncfSInt32 tracks = mapping->GetNumberOfTracks();
     trial.Expect(tracks >= 1, "one track at least", std::to_string(tracks));
@@ -101,7 +98,8 @@ void SamplesLieInTheFile(Containers& containers) {
 
 void RefusesOtherTracks(Containers& containers) {
     Trial& trial = containers.trial();
-    const auto mapping = MappingOf(containers, WriteSoundMovie(containers.folder()).file);
+    const auto container = containers.Open(WriteSoundMovie(containers.folder()).file);
+    const auto mapping = MappingOf(trial, container.get());
     const ncfUInt32 tracks = TracksOf(*mapping);
     for (const ncfUInt32 track : {tracks, 0x7FFFFFFFu, 0xFFFFFFFFu}) {
         trial.Doing("asking for samples of track " + std::to_string(track) + " of " +
@@ -152,7 +150,7 @@ template <Refused refused>
 void MappingRefused(Containers& containers) {
     Trial& trial = containers.trial();
     const SampleMovie movie = WriteSoundMovie(containers.folder());
-    MappingOf(containers, movie.file);
+    MappingOf(trial, containers.Open(movie.file).get());
     RefuseEach(
         containers.module(), refused,
         [&](int number) {
