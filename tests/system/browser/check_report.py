@@ -309,6 +309,30 @@ class ReportInBrowser(ReportTest):
         self.page.click(".reset")
         self.assertEqual(len(self.names()), self.count)
 
+    def test_names_rates_by_their_size(self):
+        labels = ["24/1", "24000/1001", "30/1", "30000/1001", "5/1", "50/1"]
+
+        def change(whole):
+            whole["odd"] = [{"id": "rates", "title": "Mixed rates", "words": "w",
+                             "groups": [{"label": label, "clips": [0]} for label in labels]}]
+        self.page.open(pages.with_report(self.report, change, self.report.with_name("rates.html")), "#/odd")
+        told = [float(one.split("\u00a0")[0]) for one in self.page.texts(".finding .chip")]
+        self.assertEqual(told, [5, 23.976, 24, 29.97, 30, 50])
+
+    def test_shows_all_marks_of_a_clip(self):
+        warning = {"kind": "pictures", "reason": "r"}
+        for traits in (["noSound"], ["noSound", "noTimecode"], ["sampleProvider", "noSound", "rotated"]):
+            for warnings in ([], [warning]):
+                members = {"warnings": warnings, "traits": [{"id": one, "words": "w"} for one in traits]}
+                page = self.report.with_name("marks.html")
+                pages.with_clip(self.report, 0, members, page)
+                for width in (800, 1280, 1440, 3840):
+                    self.page.open(page, width=width)
+                    cut = self.page.run(
+                        "return [...document.querySelectorAll('.marks')].filter((one) => one.scrollHeight >"
+                        "one.clientHeight || one.scrollWidth > one.clientWidth).map((one) => one.textContent)")
+                    self.assertEqual(cut, [], (width, members))
+
     def test_keeps_few_rows_of_many_and_shows_each(self):
         self.page.open(self.many)
         self.assertLess(len(self.names()), 60)
