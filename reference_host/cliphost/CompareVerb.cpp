@@ -20,6 +20,18 @@ struct CompareOptions {
     bool json = false;
 };
 
+// A file to be compared. The status of a failure can be that of a difference, so its words tell
+// that there was no comparison.
+host::Ref<IAAFFile> Open(const AafLibrary& library, const std::filesystem::path& file) {
+    try {
+        return library.Open(file);
+    } catch (const Failure& failure) {
+        Problem problem = failure.problem();
+        problem.reason = "not compared: " + problem.reason;
+        throw Failure(failure.status(), problem);
+    }
+}
+
 // A reader of the output may go away before all is told; what it saw counts for the status.
 template <class Printer>
 void PrintComparison(Printer& printer, IAAFFile* before, IAAFFile* after, int& status) {
@@ -47,7 +59,9 @@ void AddCompare(CLI::App& app, const SessionOptions& session, int& status) {
                     "rest by content and order.\n") +
         kLeftOutOfComparison +
         "\n\nExit status: 0, the files are alike; 1, they differ, or one can't be read as AAF; 2, "
-        "the call is at fault.");
+        "the call is at fault.\nWhere they were compared, and only there, the last line counts "
+        "what "
+        "differs and what is alike\n(with --json: the member counts).");
     auto options = std::make_shared<CompareOptions>();
     AddPath(*verb, "before", options->before, "An AAF file")->required();
     AddPath(*verb, "after", options->after, "The one that is told against it")->required();
@@ -61,8 +75,8 @@ void AddCompare(CLI::App& app, const SessionOptions& session, int& status) {
         // Behind the start of an answer, a failure would be none.
         AnswerFailureToo(options->json, schema::kCompare, files, [&] {
             library = LoadAafLibrary(session);
-            before = library->Open(options->before);
-            after = library->Open(options->after);
+            before = Open(*library, options->before);
+            after = Open(*library, options->after);
         });
         if (options->json) {
             ComparisonJson json(WithSchema(schema::kCompare, files), ComparisonJson::Form::Lines);

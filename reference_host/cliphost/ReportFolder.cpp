@@ -5,12 +5,12 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <iterator>
+#include <initializer_list>
 #include <nlohmann/json.hpp>
 #include <string_view>
 #include <utility>
-#include <vector>
 
+#include "reference_host/cliphost/Digest.h"
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/cliphost/OutputProblem.h"
@@ -22,18 +22,41 @@ namespace cliphost {
 namespace {
 
 constexpr std::size_t kLeastDigits = 5;
-constexpr std::string_view kEndings[] = {"-poster.webp", "-poster.png", "-strip.webp",
-                                         "-strip.png"};
+constexpr std::size_t kDigestDigits = 12;
 
-// "00017-poster.webp"
-std::string PictureName(std::size_t clip, const char* name, std::string_view type) {
-    return fmt::format("{:0{}}-{}.{}", clip, kLeastDigits, name, type.substr(type.find('/') + 1));
+// "00017-poster-0f3a52b1c9d4.webp"
+std::string PictureName(std::size_t clip, const char* name, std::string_view bytes,
+                        std::string_view type) {
+    return fmt::format("{:0{}}-{}-{}.{}", clip, kLeastDigits, name,
+                       TextOf(DigestOf(bytes)).substr(0, kDigestDigits),
+                       type.substr(type.find('/') + 1));
 }
 
+// Takes these characters off the beginning; how many they were.
+std::size_t Skip(std::string_view& text, std::string_view characters) {
+    const std::size_t count = std::min(text.find_first_not_of(characters), text.size());
+    text.remove_prefix(count);
+    return count;
+}
+
+bool SkipOneOf(std::string_view& text, std::initializer_list<std::string_view> words) {
+    for (const std::string_view word : words) {
+        if (text.substr(0, word.size()) == word) {
+            text.remove_prefix(word.size());
+            return true;
+        }
+    }
+    return false;
+}
+
+// Those of earlier versions have no digest.
 bool IsPictureName(std::string_view file) {
-    const std::size_t end = std::min(file.find_first_not_of("0123456789"), file.size());
-    return end >= kLeastDigits && std::find(std::begin(kEndings), std::end(kEndings),
-                                            file.substr(end)) != std::end(kEndings);
+    if (Skip(file, "0123456789") < kLeastDigits || !SkipOneOf(file, {"-poster", "-strip"})) {
+        return false;
+    }
+    const bool hasDigest = SkipOneOf(file, {"-"});
+    return (!hasDigest || Skip(file, "0123456789abcdef") == kDigestDigits) &&
+           (file == ".webp" || file == ".png");
 }
 
 }  // namespace
@@ -48,8 +71,8 @@ ReportFolder::ReportFolder(std::filesystem::path folder)
 }
 
 void ReportFolder::Take(nlohmann::ordered_json& picture, std::size_t clip, const char* name) {
-    const std::string file = PictureName(clip, name, picture.value("type", std::string()));
     const std::string bytes = report::FromBase64(picture.value("data", std::string()));
+    const std::string file = PictureName(clip, name, bytes, picture.value("type", std::string()));
     WriteWholeFile(aside_->path() / file, {bytes.begin(), bytes.end()});
     names_.insert(file);
     picture.erase("data");
@@ -57,18 +80,29 @@ void ReportFolder::Take(nlohmann::ordered_json& picture, std::size_t clip, const
         host::text::PercentEncoded(host::system::GenericPathText(folder_.filename() / file));
 }
 
+ReportFolder::~ReportFolder() {
+    std::error_code ignored;
+    for (const std::filesystem::path& picture : withoutPage_) {
+        std::filesystem::remove(picture, ignored);
+    }
+}
+
 void ReportFolder::PutIntoPlace() {
     for (const std::string& name : names_) {
         std::error_code error;
-        std::filesystem::rename(aside_->path() / name, folder_ / name, error);
+        const std::filesystem::path place = folder_ / name;
+        if (!std::filesystem::exists(place, error)) {
+            withoutPage_.push_back(place);
+        }
+        std::filesystem::rename(aside_->path() / name, place, error);
         if (error) {
-            throw Failure(kExitCaller,
-                          NotWritten(folder_ / name, error.default_error_condition().value()));
+            throw Failure(kExitCaller, NotWritten(place, error.default_error_condition().value()));
         }
     }
 }
 
-void ReportFolder::RemoveOthers() const {
+void ReportFolder::PageIsInPlace() {
+    withoutPage_.clear();
     std::error_code ignored;
     std::vector<std::filesystem::path> others;
     for (std::filesystem::directory_iterator entry(folder_, ignored), end; entry != end;

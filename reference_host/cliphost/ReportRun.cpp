@@ -281,7 +281,7 @@ void ReportRun::WritePage() {
     }
     output_->Finish();
     if (pictures_) {
-        pictures_->RemoveOthers();
+        pictures_->PageIsInPlace();
     }
     if (!host::system::IsStandardOutput(options_.movies.together)) {
         fmt::print("{}: {}, {:.1f} MB\n", host::DisplayPath(options_.movies.together),

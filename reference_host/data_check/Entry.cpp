@@ -45,11 +45,22 @@ std::size_t Distance(std::string_view a, std::string_view b) {
     return row.back();
 }
 
-std::string HintFor(const std::string& name, const std::vector<const char*>& known) {
+// The known name that one is mistyped of; null where it is like none.
+const char* Meant(const std::string& name, const std::vector<const char*>& known) {
+    const char* meant = nullptr;
+    std::size_t least = kLikeness + 1;
     for (const char* const one : known) {
-        if (name.size() <= kLongestCompared && Distance(name, one) <= kLikeness) {
-            return fmt::format("write {}, as the module spells it", one);
-        }
+        const std::size_t distance =
+            name.size() <= kLongestCompared ? Distance(name, one) : kLikeness + 1;
+        meant = distance < least ? one : meant;
+        least = std::min(least, distance);
+    }
+    return meant;
+}
+
+std::string HintFor(const std::string& name, const std::vector<const char*>& known) {
+    if (const char* const meant = Meant(name, known)) {
+        return fmt::format("write {}, as the module spells it", meant);
     }
     std::string all;
     for (const char* const one : known) {
@@ -62,12 +73,28 @@ std::string HintFor(const NumberRule& rule) {
     return fmt::format("give {}", rule.accepted);
 }
 
-void CheckName(const EntryReader& reader, const std::string& name, host::XmlPlace place,
-               const std::vector<const char*>& known) {
-    const auto isThis = [&](const char* one) { return name == one; };
-    if (name.rfind("xmlns", 0) != 0 && std::none_of(known.begin(), known.end(), isThis)) {
-        reader.Tell(place, fmt::format("{} means nothing here", Shown(name)), HintFor(name, known));
-    }
+bool IsKnown(const std::string& name, const std::vector<const char*>& known) {
+    return name.rfind("xmlns", 0) == 0 ||
+           std::any_of(known.begin(), known.end(), [&](const char* one) { return name == one; });
+}
+
+void TellUnknown(const EntryReader& reader, const std::string& name, host::XmlPlace place,
+                 const std::vector<const char*>& known) {
+    reader.Tell(place, fmt::format("{} means nothing here", Shown(name)), HintFor(name, known));
+}
+
+// Whether a value or element of a name stands within one of the children.
+bool StandsDeeper(const PlacedElement& parent, std::string_view name) {
+    return std::any_of(parent.elements.begin(), parent.elements.end(),
+                       [&](const PlacedElement& child) {
+                           return !ItemsOf(child, name).empty() || StandsDeeper(child, name);
+                       });
+}
+
+// All but the zeros before a number; of nothing but zeros, the last.
+std::string WithoutZeros(const std::string& text) {
+    return text.empty() ? text
+                        : text.substr(std::min(text.find_first_not_of('0'), text.size() - 1));
 }
 
 // Finds entries as the module does: wherever they stand, whatever is around them.
@@ -133,7 +160,7 @@ std::optional<Item> EntryReader::One(const PlacedElement& parent, const char* na
                                      const std::string& hint) const {
     std::vector<Item> items = ItemsOf(parent, name);
     if (items.empty()) {
-        Tell(parent.place, fmt::format("{} lacks {}", parent.name, name), hint);
+        TellLack(parent, name, hint);
         return std::nullopt;
     }
     if (items.size() > 1) {
@@ -176,6 +203,13 @@ std::optional<std::uint32_t> EntryReader::NumberOf(const Item& item, const Numbe
 std::optional<std::uint32_t> EntryReader::CheckedNumber(const Item& item,
                                                         const NumberRule& rule) const {
     const std::optional<std::uint32_t> number = NumberIn(item.value);
+    const std::optional<std::uint32_t> meant = NumberIn(WithoutZeros(item.value));
+    if (!number && meant && rule.accepts(*meant)) {
+        Tell(item.place,
+             fmt::format("{} has zeros before its number: \"{}\"", rule.name, Shown(item.value)),
+             fmt::format("write {}", *meant));
+        return std::nullopt;
+    }
     if (!number || !rule.accepts(*number)) {
         Tell(item.place, fmt::format("{} can't be \"{}\"", rule.name, Shown(item.value)),
              HintFor(rule));
@@ -196,18 +230,34 @@ const PlacedElement* EntryReader::OneChild(const PlacedElement& parent, const ch
         found = child.name == name ? &child : found;
     }
     if (found == nullptr) {
-        Tell(parent.place, fmt::format("{} lacks {}", parent.name, name), hint);
+        TellLack(parent, name, hint);
     }
     return found;
 }
 
-void EntryReader::CheckNames(const PlacedElement& parent,
-                             const std::vector<const char*>& known) const {
+// What is mistyped, or stands within something that means nothing, was told as that.
+void EntryReader::TellLack(const PlacedElement& parent, const char* name,
+                           const std::string& hint) const {
+    if (meant_.count({&parent, name}) == 0 && !StandsDeeper(parent, name)) {
+        Tell(parent.place, fmt::format("{} lacks {}", parent.name, name), hint);
+    }
+}
+
+void EntryReader::CheckNames(const PlacedElement& parent, const std::vector<const char*>& known) {
+    const auto check = [&](const std::string& name, host::XmlPlace place) {
+        if (IsKnown(name, known)) {
+            return;
+        }
+        TellUnknown(*this, name, place, known);
+        if (const char* const meant = Meant(name, known)) {
+            meant_.insert({&parent, meant});
+        }
+    };
     for (const PlacedAttribute& attribute : parent.attributes) {
-        CheckName(*this, attribute.name, attribute.place, known);
+        check(attribute.name, attribute.place);
     }
     for (const PlacedElement& child : parent.elements) {
-        CheckName(*this, child.name, child.place, known);
+        check(child.name, child.place);
     }
 }
 
@@ -221,7 +271,9 @@ std::vector<const PlacedElement*> EntriesOf(const PlacedElement& root, const cha
         search.Enter(child);
     }
     for (const PlacedElement* const stranger : search.strangers) {
-        CheckName(reader, stranger->name, stranger->place, {name});
+        if (!IsKnown(stranger->name, {name})) {
+            TellUnknown(reader, stranger->name, stranger->place, {name});
+        }
     }
     if (search.entries.empty()) {
         reader.Tell(root.place, fmt::format("there is no {} in it", name), "add one");

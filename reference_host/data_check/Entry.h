@@ -3,6 +3,10 @@
 #pragma once
 
 #include <optional>
+#include <set>
+#include <string>
+#include <utility>
+#include <vector>
 
 #include "reference_host/data_check/Findings.h"
 #include "reference_host/xml/PlacedDocument.h"
@@ -44,16 +48,22 @@ public:
     // The only child of a name. The same.
     const host::PlacedElement* OneChild(const host::PlacedElement& parent, const char* name,
                                         const std::string& hint) const;
-    // Tells attributes and children that are none of these.
-    void CheckNames(const host::PlacedElement& parent, const std::vector<const char*>& known) const;
+    // Tells attributes and children that are none of these. To be called before the others: that
+    // one of these lacks which was mistyped so, they do not tell.
+    void CheckNames(const host::PlacedElement& parent, const std::vector<const char*>& known);
 
 private:
     // Whether nothing keeps an item from being a value; what does is told.
     bool IsSound(const Item& item, const char* name) const;
     std::optional<std::uint32_t> CheckedNumber(const Item& item, const NumberRule& rule) const;
 
+    void TellLack(const host::PlacedElement& parent, const char* name,
+                  const std::string& hint) const;
+
     DataFile file_;
     Findings& findings_;
+    // Names that were mistyped, and in what.
+    std::set<std::pair<const host::PlacedElement*, std::string>> meant_ = {};
 };
 
 // A value for a text about it, in which it is cut where it is long.

@@ -15,7 +15,7 @@ constexpr char kHintForCode[] =
 constexpr NumberRule kVcid = {"vcid", IsId, "a whole number from 1 to 2147483647, or leave it out",
                               false};
 
-std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryReader& reader,
+std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, EntryReader& reader,
                                  Findings& findings) {
     reader.CheckNames(entry, {"FourChar", "Vendor", "vcid"});  // the module passes over others
     const std::size_t before = findings.count();
@@ -40,13 +40,13 @@ std::optional<MapperRow> ReadRow(const host::PlacedElement& entry, const EntryRe
         row.vendor = vendor ? vendor->value.substr(0, kLengthOfCode) : "";
     }
     row.id = reader.Number(entry, kVcid).value_or(0);
-    return findings.count() == before ? std::optional<MapperRow>(row) : std::nullopt;
+    return code && findings.count() == before ? std::optional<MapperRow>(row) : std::nullopt;
 }
 
 }  // namespace
 
 MapperRows ReadMapperRows(const host::PlacedElement& root, Findings& findings) {
-    const EntryReader reader(DataFile::Mapper, findings);
+    EntryReader reader(DataFile::Mapper, findings);
     MapperRows all;
     for (const host::PlacedElement* const entry : EntriesOf(root, "FourCharMapping", reader)) {
         if (std::optional<MapperRow> row = ReadRow(*entry, reader, findings)) {

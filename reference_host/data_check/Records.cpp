@@ -139,6 +139,7 @@ private:
         if (descriptor == nullptr) {
             return std::nullopt;
         }
+        reader_.CheckNames(*descriptor, NamesOf(*descriptor));
         std::optional<Record> record = ReadRaster(*descriptor);
         CheckDescriptor(*descriptor);
         if (!record || !id) {
@@ -189,45 +190,62 @@ private:
         record.storedHeight = Number(descriptor, kStoredHeight).value_or(0);
         record.sampledWidth = Number(descriptor, kSampledWidth).value_or(record.storedWidth);
         record.displayHeight = Number(descriptor, kDisplayHeight).value_or(record.storedHeight);
-        return findings_.count() == before ? std::optional<Record>(record) : std::nullopt;
+        const bool hasAll = NumberOf(kLayout) && NumberOf(kStoredWidth) && NumberOf(kStoredHeight);
+        return hasAll && findings_.count() == before ? std::optional<Record>(record) : std::nullopt;
     }
 
-    void CheckDescriptor(const PlacedElement& descriptor) {
-        std::vector<const char*> known = {kSampleRate,        kAspect,
+    // What the module reads of a descriptor.
+    static std::vector<const char*> NamesOf(const PlacedElement& descriptor) {
+        std::vector<const char*> names = {kSampleRate,        kAspect,
                                           kLineMap,           kLayout.name,
                                           kStoredWidth.name,  kStoredHeight.name,
                                           kSampledWidth.name, kDisplayHeight.name};
-        CheckNumbers(descriptor, kCommon, known);
+        names.insert(names.end(), std::begin(kLabels), std::end(kLabels));
+        const auto add = [&](const auto& rules) {
+            for (const NumberRule& rule : rules) {
+                names.push_back(rule.name);
+            }
+        };
+        add(kCommon);
+        if (descriptor.name == kRgbaKind) {
+            add(kRgba);
+            names.push_back(kPixelLayout);
+        } else {
+            add(kCdci);
+        }
+        if (descriptor.name == kMpeg2Kind) {
+            add(kMpeg2);
+            names.push_back(kProfile);
+        }
+        return names;
+    }
+
+    void CheckDescriptor(const PlacedElement& descriptor) {
+        CheckNumbers(descriptor, kCommon);
         for (const char* const label : kLabels) {
-            known.push_back(label);
             CheckLabel(descriptor, label);
         }
         CheckAspect(descriptor);
         CheckLineMap(descriptor);
         CheckSizes(descriptor);
         if (descriptor.name == kRgbaKind) {
-            CheckNumbers(descriptor, kRgba, known);
-            known.push_back(kPixelLayout);
+            CheckNumbers(descriptor, kRgba);
             CheckLevels(descriptor, kMinRef, kMaxRef, CheckPixelLayout(descriptor));
         } else {
-            CheckNumbers(descriptor, kCdci, known);
+            CheckNumbers(descriptor, kCdci);
             const std::uint32_t depth = NumberOf(kComponentDepth).value_or(0);
             CheckLevels(descriptor, kBlack, kWhite, depth);
             CheckDepth(descriptor, kColorRange, depth);
         }
         if (descriptor.name == kMpeg2Kind) {
-            CheckNumbers(descriptor, kMpeg2, known);
-            known.push_back(kProfile);
+            CheckNumbers(descriptor, kMpeg2);
             CheckProfile(descriptor);
         }
-        reader_.CheckNames(descriptor, known);
     }
 
     template <std::size_t count>
-    void CheckNumbers(const PlacedElement& descriptor, const NumberRule (&rules)[count],
-                      std::vector<const char*>& known) {
+    void CheckNumbers(const PlacedElement& descriptor, const NumberRule (&rules)[count]) {
         for (const NumberRule& rule : rules) {
-            known.push_back(rule.name);
             static_cast<void>(Number(descriptor, rule));
         }
     }

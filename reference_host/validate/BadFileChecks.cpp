@@ -5,10 +5,10 @@
 namespace validate {
 namespace {
 
-void DescribeAll(Trial& trial,
-                 std::vector<SampleMovie> (*write)(const std::filesystem::path& folder)) {
-    Containers containers(trial);
-    for (const SampleMovie& movie : write(trial.folder())) {
+template <std::vector<SampleMovie> (*write)(const std::filesystem::path& folder)>
+void DescribeAll(Containers& containers) {
+    Trial& trial = containers.trial();
+    for (const SampleMovie& movie : write(containers.folder())) {
         DescribeAnything(containers, movie);
     }
     containers.NoMore();
@@ -16,23 +16,11 @@ void DescribeAll(Trial& trial,
     ExpectIdle(containers.module(), "when all containers are released");
 }
 
-void BrokenFiles(Trial& trial) {
-    DescribeAll(trial, WriteBrokenMovies);
-}
-
-void HostileFiles(Trial& trial) {
-    DescribeAll(trial, WriteHostileMovies);
-}
-
-void HugeFiles(Trial& trial) {
-    DescribeAll(trial, WriteHugeMovies);
-}
-
-void GoodAfterBad(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie good = WriteSoundMovie(trial.folder());
+void GoodAfterBad(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie good = WriteSoundMovie(containers.folder());
     DescribeSound(containers, good.file);
-    for (const SampleMovie& movie : WriteBrokenMovies(trial.folder())) {
+    for (const SampleMovie& movie : WriteBrokenMovies(containers.folder())) {
         trial.Doing("describing a file, and a sound movie after it: " + movie.about);
         IsSupported(trial, containers.Open(movie.file).get());
         Describe(trial, containers.Open(movie.file).get());
@@ -41,9 +29,9 @@ void GoodAfterBad(Trial& trial) {
     }
 }
 
-void FileShrinks(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void FileShrinks(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);
     const auto container = containers.Open(movie.file);
     Describe(trial, container.get());
@@ -63,16 +51,17 @@ std::vector<Check> BadFileChecks() {
     return {
         {"files-broken",
          "Empty, cut and foreign files are refused or described; nothing is left of them.", kTrust,
-         BrokenFiles},
+         OfEachContainer<DescribeAll<WriteBrokenMovies>>},
         {"files-hostile",
          "Files whose numbers lie are refused or described, in time and without much memory.",
-         kTrust, HostileFiles},
+         kTrust, OfEachContainer<DescribeAll<WriteHostileMovies>>},
         {"files-huge", "Movies beyond 4 GiB and of very many samples are described or refused.",
-         "positions or sizes are kept in 32 bits", HugeFiles},
+         "positions or sizes are kept in 32 bits", OfEachContainer<DescribeAll<WriteHugeMovies>>},
         {"files-good-after-bad", "After a bad file the next sound movie is described.",
-         "a failure leaves a flag or a lock behind", GoodAfterBad},
+         "a failure leaves a flag or a lock behind", OfEachContainer<GoodAfterBad>},
         {"files-that-change", "A file that shrinks or goes while its container lives does no harm.",
-         "the file is mapped, or what was read before is taken for what is there", FileShrinks},
+         "the file is mapped, or what was read before is taken for what is there",
+         OfEachContainer<FileShrinks>},
     };
 }
 

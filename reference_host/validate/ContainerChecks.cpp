@@ -9,8 +9,8 @@
 namespace validate {
 namespace {
 
-void TellsFileTypes(Trial& trial) {
-    Containers containers(trial);
+void TellsFileTypes(Containers& containers) {
+    Trial& trial = containers.trial();
     const auto container = containers.New();
     const ncfUInt32 count = container->GetFileTypeCount();
     for (ncfUInt32 i = 0; i < count; ++i) {
@@ -35,8 +35,8 @@ void TellsFileTypes(Trial& trial) {
     }
 }
 
-void TellsCapabilities(Trial& trial) {
-    Containers containers(trial);
+void TellsCapabilities(Containers& containers) {
+    Trial& trial = containers.trial();
     trial.Doing("calling GetCapabilities of a container without a path");
     constexpr ncfUInt32 kUnset = 0xA5A5A5A5;
     ncfUInt32 flags = kUnset;
@@ -44,34 +44,34 @@ void TellsCapabilities(Trial& trial) {
     trial.Expect(flags != kUnset, "the output is set", "it is left as it was");
 }
 
-void TakesAPath(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void TakesAPath(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     const auto path = host::ModulePath(movie.file);
     trial.Doing("calling SetFilePath with the path of a movie");
     trial.ExpectSuccess(containers.New()->SetFilePath(path.get()));
 }
 
-void DescribesAMovie(Trial& trial) {
-    Containers containers(trial);
-    const auto container = containers.Open(WriteSoundMovie(trial.folder()).file);
+void DescribesAMovie(Containers& containers) {
+    Trial& trial = containers.trial();
+    const auto container = containers.Open(WriteSoundMovie(containers.folder()).file);
     trial.Doing("describing a sound movie with picture, sound and timecode");
     trial.ExpectSuccess(Describe(trial, container.get()).result,
                         "a description, since the container claims *.mov");
 }
 
-void TakesOnePath(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void TakesOnePath(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     const auto container = containers.Open(movie.file);
     trial.Doing("calling SetFilePath a second time");
     const auto path = host::ModulePath(movie.file);
     trial.ExpectResult(NMA_E_ALREADYSET, container->SetFilePath(path.get()), "NMA_E_ALREADYSET");
 }
 
-void CopiesThePath(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void CopiesThePath(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);
     const auto container = containers.New();
     const auto path = host::ModulePath(movie.file);
@@ -82,8 +82,8 @@ void CopiesThePath(Trial& trial) {
                         "the string was copied, so the movie is described");
 }
 
-void NeedsAPath(Trial& trial) {
-    Containers containers(trial);
+void NeedsAPath(Containers& containers) {
+    Trial& trial = containers.trial();
     const auto container = containers.New();
     trial.Doing("describing without a path");
     trial.ExpectRefusal(Describe(trial, container.get()).result);
@@ -95,39 +95,45 @@ void NeedsAPath(Trial& trial) {
                  trial.Text(result) + (mapping ? ", and a mapping" : ", and null"));
 }
 
-void ContainerRefusesNull(Trial& trial) {
-    Containers containers(trial);
+void ContainerRefusesNull(Containers& containers) {
+    Trial& trial = containers.trial();
     const auto container = containers.New();
     trial.Doing("calling SetFilePath with null for the path");
     trial.ExpectRefusal(container->SetFilePath(nullptr));
     trial.Doing("calling GetCapabilities with null for the output");
     trial.ExpectRefusal(container->GetCapabilities(nullptr));
-    const auto whole = containers.Open(WriteSoundMovie(trial.folder()).file);
+    const auto whole = containers.Open(WriteSoundMovie(containers.folder()).file);
     trial.Doing("calling GetAAFMasterClips with null for the output");
     trial.ExpectRefusal(whole->GetAAFMasterClips(nullptr));
     trial.Doing("calling GetSampleMapping with null for the output");
     trial.ExpectRefusal(whole->GetSampleMapping(nullptr));
 }
 
-void GivesLocksBack(Trial& trial) {
-    LockCalls calls;  // outlives the module's host
-    Containers containers(trial, [&](host::Host& host) { RegisterCountingLocks(host, calls); });
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void GivesLocksBack(Containers& containers, const LockCalls& calls) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeAnything(containers, movie);
     trial.Doing("counting the locks that were taken while a movie was described");
     ExpectGivenBack(trial, calls);
-    for (const SampleMovie& broken : WriteBrokenMovies(trial.folder())) {
+    for (const SampleMovie& broken : WriteBrokenMovies(containers.folder())) {
         DescribeAnything(containers, broken);
         trial.Doing("counting the locks that were taken for a file: " + broken.about);
         ExpectGivenBack(trial, calls);
     }
 }
 
-void RefusesMissingFiles(Trial& trial) {
-    Containers containers(trial);
+void GivesLocksBack(Trial& trial) {
+    LockCalls calls;  // outlives the modules' hosts
+    ForEachContainer(
+        trial, [&](Containers& containers) { GivesLocksBack(containers, calls); },
+        [&](host::Host& host) { RegisterCountingLocks(host, calls); });
+}
+
+void RefusesMissingFiles(Containers& containers) {
+    Trial& trial = containers.trial();
     for (const auto& [what, path] :
-         {std::pair("a file that is not there", trial.folder() / "absent.mov"),
-          std::pair("a folder", trial.folder())}) {
+         {std::pair("a file that is not there", containers.folder() / "absent.mov"),
+          std::pair("a folder", containers.folder())}) {
         const auto container = containers.Open(path);
         trial.Doing(std::string("describing ") + what);
         trial.ExpectRefusal(Describe(trial, container.get()).result);
@@ -136,9 +142,9 @@ void RefusesMissingFiles(Trial& trial) {
     }
 }
 
-void SupportsWhatItDescribes(Trial& trial) {
-    Containers containers(trial);
-    for (const SampleMovie& movie : WriteSoundMovies(trial.folder())) {
+void SupportsWhatItDescribes(Containers& containers) {
+    Trial& trial = containers.trial();
+    for (const SampleMovie& movie : WriteSoundMovies(containers.folder())) {
         const auto container = containers.Open(movie.file);
         trial.Doing("asking whether a container supports a movie: " + movie.about);
         const bool isSupported = IsSupported(trial, container.get());
@@ -149,9 +155,9 @@ void SupportsWhatItDescribes(Trial& trial) {
     }
 }
 
-void DescribesAgain(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void DescribesAgain(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);
     const auto container = containers.Open(movie.file);
     std::vector<host::Ref<IAAFFile>> files;
@@ -163,9 +169,9 @@ void DescribesAgain(Trial& trial) {
     }
 }
 
-void ClosesTheFile(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void ClosesTheFile(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);  // whatever is opened once and for all is open now
     const std::size_t before = host::system::OwnFacts().handles;
     for (int round = 0; round < 10; ++round) {
@@ -177,18 +183,18 @@ void ClosesTheFile(Trial& trial) {
                  std::to_string(after - before) + " more after ten movies");
 }
 
-void LeavesNothingAlive(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void LeavesNothingAlive(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);
     containers.NoMore();
     trial.Doing("calling NCFCanUnloadNow after a movie was described and released");
     ExpectIdle(containers.module(), "when container and description are released");
 }
 
-void LeavesTheFileAlone(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void LeavesTheFileAlone(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     const auto size = std::filesystem::file_size(movie.file);
     const auto date = std::filesystem::last_write_time(movie.file);
     DescribeAnything(containers, movie);
@@ -197,15 +203,15 @@ void LeavesTheFileAlone(Trial& trial) {
                      std::filesystem::file_size(movie.file) == size &&
                      std::filesystem::last_write_time(movie.file) == date,
                  "the movie is as it was", "it was written or removed");
-    const auto entries = std::distance(std::filesystem::directory_iterator(trial.folder()),
+    const auto entries = std::distance(std::filesystem::directory_iterator(containers.folder()),
                                        std::filesystem::directory_iterator());
     trial.Expect(entries == 1, "nothing is written beside a movie",
                  std::to_string(entries) + " files instead of 1");
 }
 
-void WorksOnThreads(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void WorksOnThreads(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);
     trial.Doing("describing a movie with a container on each of four threads, ten times");
     OnThreads(4, [&](unsigned) {
@@ -217,10 +223,10 @@ void WorksOnThreads(Trial& trial) {
     });
 }
 
-void TakesOddNames(Trial& trial) {
-    Containers containers(trial);
-    DescribeSound(containers, WriteSoundMovie(trial.folder()).file);
-    const std::filesystem::path folder = trial.folder() / "odd";
+void TakesOddNames(Containers& containers) {
+    Trial& trial = containers.trial();
+    DescribeSound(containers, WriteSoundMovie(containers.folder()).file);
+    const std::filesystem::path folder = containers.folder() / "odd";
     MakeFolder(folder);
     for (const SampleMovie& movie : WriteOddlyNamedMovies(folder)) {
         trial.Doing("describing a movie called " + host::DisplayPath(movie.file.filename()));
@@ -229,9 +235,10 @@ void TakesOddNames(Trial& trial) {
     }
 }
 
-void DescriptionRefused(Trial& trial, Refused refused) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+template <Refused refused>
+void DescriptionRefused(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);
     RefuseEach(
         containers.module(), refused,
@@ -250,14 +257,6 @@ void DescriptionRefused(Trial& trial, Refused refused) {
                         "success, as before the refusals");
 }
 
-void CreationsRefusedInDescription(Trial& trial) {
-    DescriptionRefused(trial, Refused::kCreations);
-}
-
-void QueriesRefusedInDescription(Trial& trial) {
-    DescriptionRefused(trial, Refused::kQueries);
-}
-
 }  // namespace
 
 std::vector<Check> ContainerChecks() {
@@ -267,53 +266,57 @@ std::vector<Check> ContainerChecks() {
         {"container-file-types",
          "A container tells its file types: strings for each index, NCF_E_NOTFOUND beyond, and "
          "outputs that may be null.",
-         "an output is used before it is looked at, or the index is not compared", TellsFileTypes},
+         "an output is used before it is looked at, or the index is not compared",
+         OfEachContainer<TellsFileTypes>},
         {"container-capabilities", "A container tells its capabilities, before it has a path.",
-         "the output is not set, or a path is needed", TellsCapabilities},
+         "the output is not set, or a path is needed", OfEachContainer<TellsCapabilities>},
         {"container-takes-path", "A container takes the path of a movie.",
-         "the path is refused in the form that hosts give it", TakesAPath},
+         "the path is refused in the form that hosts give it", OfEachContainer<TakesAPath>},
         {"container-describes", "A container that claims *.mov describes a sound movie.",
-         "a part of a common movie is not understood", DescribesAMovie},
+         "a part of a common movie is not understood", OfEachContainer<DescribesAMovie>},
         {"container-path-once", "A container takes one path; another gets NMA_E_ALREADYSET.",
-         "the path is replaced", TakesOnePath},
+         "the path is replaced", OfEachContainer<TakesOnePath>},
         {"container-path-copied", "A container copies its path.",
-         "the host's string is kept instead of its text", CopiesThePath},
+         "the host's string is kept instead of its text", OfEachContainer<CopiesThePath>},
         {"container-without-path", "A container without a path refuses to describe.",
-         "the path is used before it is looked at", NeedsAPath},
+         "the path is used before it is looked at", OfEachContainer<NeedsAPath>},
         {"container-null-arguments", "A container refuses null for a path and for an output.",
-         "the argument is used before it is looked at", ContainerRefusesNull},
+         "the argument is used before it is looked at", OfEachContainer<ContainerRefusesNull>},
         {"container-locks",
          "A description gives each lock of the host's back that it takes, and so does a refusal.",
          "a way out of a function passes over the Unlock", GivesLocksBack},
         {"container-missing-file", "A container refuses a file that is not there, and a folder.",
-         "the file is not opened before the description is made", RefusesMissingFiles},
+         "the file is not opened before the description is made",
+         OfEachContainer<RefusesMissingFiles>},
         {"container-supports", "What a container describes it also supports.",
-         "the two go by different rules", SupportsWhatItDescribes},
+         "the two go by different rules", OfEachContainer<SupportsWhatItDescribes>},
         {"container-describes-again",
          "A container describes its clip anew as often as it is asked.",
-         "something is used up by the first description", DescribesAgain},
+         "something is used up by the first description", OfEachContainer<DescribesAgain>},
         {"container-closes-file", "A container that is gone holds no file open.",
-         "a file is opened and never closed", ClosesTheFile},
+         "a file is opened and never closed", OfEachContainer<ClosesTheFile>},
         {"container-leaves-nothing",
          "When a container and its description are released, the module can be unloaded.",
-         "clip and container hold each other", LeavesNothingAlive},
+         "clip and container hold each other", OfEachContainer<LeavesNothingAlive>},
         {"container-leaves-file",
          "A container only reads: the movie stays as it is, and nothing is written beside it.",
-         "the file is opened for writing, or a cache is put beside it", LeavesTheFileAlone},
+         "the file is opened for writing, or a cache is put beside it",
+         OfEachContainer<LeavesTheFileAlone>},
         {"container-threads", "Containers of their own work on several threads at once.",
-         "containers share something that has no lock", WorksOnThreads},
+         "containers share something that has no lock", OfEachContainer<WorksOnThreads>},
         {"container-odd-names",
          "A movie is described under any name: blanks, quotes, per cent signs, other scripts, line "
          "ends, long ones.",
-         "a path is used as a format, or converted through another encoding", TakesOddNames},
+         "a path is used as a format, or converted through another encoding",
+         OfEachContainer<TakesOddNames>},
         {"container-creations-refused",
          "When the host refuses to make the n-th component that a description asks for, for every "
          "n, the movie is described or refused, and the next one works.",
-         kRefusal, CreationsRefusedInDescription},
+         kRefusal, OfEachContainer<DescriptionRefused<Refused::kCreations>>},
         {"container-queries-refused",
          "When the host refuses the n-th interface that a description asks for, for every n, the "
          "movie is described or refused, and the next one works.",
-         kRefusal, QueriesRefusedInDescription},
+         kRefusal, OfEachContainer<DescriptionRefused<Refused::kQueries>>},
     };
 }
 

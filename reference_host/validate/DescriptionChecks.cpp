@@ -51,18 +51,18 @@ std::vector<Bytes> IdsOf(Containers& containers, const std::filesystem::path& mo
     return ids;
 }
 
-void IsAnAafFile(Trial& trial) {
-    Containers containers(trial);
-    for (const SampleMovie& movie : WriteSoundMovies(trial.folder())) {
+void IsAnAafFile(Containers& containers) {
+    Trial& trial = containers.trial();
+    for (const SampleMovie& movie : WriteSoundMovies(containers.folder())) {
         const Described described = DescribeSound(containers, movie.file);
         trial.Doing("reading the header of the description of a movie: " + movie.about);
         HeaderOf(trial, described.file.get());
     }
 }
 
-void HasAMasterMob(Trial& trial) {
-    Containers containers(trial);
-    for (const SampleMovie& movie : WriteSoundMovies(trial.folder())) {
+void HasAMasterMob(Containers& containers) {
+    Trial& trial = containers.trial();
+    for (const SampleMovie& movie : WriteSoundMovies(containers.folder())) {
         const Described described = DescribeSound(containers, movie.file);
         trial.Doing("counting the master mobs of the description of a movie: " + movie.about);
         aafNumSlots_t count = 0;
@@ -71,9 +71,9 @@ void HasAMasterMob(Trial& trial) {
     }
 }
 
-void MobsHaveIds(Trial& trial) {
-    Containers containers(trial);
-    std::vector<Bytes> ids = IdsOf(containers, WriteSoundMovie(trial.folder()).file);
+void MobsHaveIds(Containers& containers) {
+    Trial& trial = containers.trial();
+    std::vector<Bytes> ids = IdsOf(containers, WriteSoundMovie(containers.folder()).file);
     trial.Doing("comparing the ids of the mobs of a description");
     trial.Expect(std::find(ids.begin(), ids.end(), Bytes(sizeof(aafMobID_t))) == ids.end(),
                  "each mob has an id", "one has zeros");
@@ -81,18 +81,18 @@ void MobsHaveIds(Trial& trial) {
                  "each mob has an id of its own", "two have the same");
 }
 
-void IdsAreStable(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void IdsAreStable(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     const auto first = IdsOf(containers, movie.file);
     trial.Doing("describing the same movie again");
     const auto again = IdsOf(containers, movie.file);
     trial.Expect(first == again, "the same mob ids each time", "others");
 }
 
-void IdsDiffer(Trial& trial) {
-    Containers containers(trial);
-    const auto movies = WriteSoundMovies(trial.folder());
+void IdsDiffer(Containers& containers) {
+    Trial& trial = containers.trial();
+    const auto movies = WriteSoundMovies(containers.folder());
     std::vector<Bytes> known;
     for (const SampleMovie& movie : movies) {
         for (Bytes& id : IdsOf(containers, movie.file)) {
@@ -106,9 +106,10 @@ void IdsDiffer(Trial& trial) {
     }
 }
 
-void MobsHaveSlots(Trial& trial) {
-    Containers containers(trial);
-    const Described described = DescribeSound(containers, WriteSoundMovie(trial.folder()).file);
+void MobsHaveSlots(Containers& containers) {
+    Trial& trial = containers.trial();
+    const Described described =
+        DescribeSound(containers, WriteSoundMovie(containers.folder()).file);
     for (const auto& mob : MobsOf(trial, described.file.get())) {
         trial.Doing("counting the slots of a mob");
         aafNumSlots_t count = 0;
@@ -117,17 +118,18 @@ void MobsHaveSlots(Trial& trial) {
     }
 }
 
-void OutlivesTheContainer(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void OutlivesTheContainer(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     const host::Ref<IAAFFile> file = DescribeSound(containers, movie.file).file;
     trial.Doing("reading a description after its container's end");
     trial.Expect(!MobsOf(trial, file.get()).empty(), "its mobs are still there", "there are none");
 }
 
-void RefusesOtherIndexes(Trial& trial) {
-    Containers containers(trial);
-    const Described described = DescribeSound(containers, WriteSoundMovie(trial.folder()).file);
+void RefusesOtherIndexes(Containers& containers) {
+    Trial& trial = containers.trial();
+    const Described described =
+        DescribeSound(containers, WriteSoundMovie(containers.folder()).file);
     const ncfSInt32 count = described.clips->GetCount();
     for (const ncfSInt32 index : {count, -1, 0x7FFFFFFF}) {
         trial.Doing("asking a container's list for clip " + std::to_string(index) + " of " +
@@ -144,24 +146,25 @@ void RefusesOtherIndexes(Trial& trial) {
 std::vector<Check> DescriptionChecks() {
     return {
         {"description-is-aaf", "A description is an open AAF file with a header.",
-         "the file is closed before it is handed out", IsAnAafFile},
+         "the file is closed before it is handed out", OfEachContainer<IsAnAafFile>},
         {"description-master-mob", "A description has a master mob, which is the clip in a bin.",
-         "the mob is not added to the header", HasAMasterMob},
+         "the mob is not added to the header", OfEachContainer<HasAMasterMob>},
         {"description-ids", "Each mob of a description has an id of its own.",
-         "an id is not set, or used for several mobs", MobsHaveIds},
+         "an id is not set, or used for several mobs", OfEachContainer<MobsHaveIds>},
         {"description-ids-stable",
          "The same movie gets the same ids each time, so a host finds its clip again.",
-         "ids are made up, or taken from the clock", IdsAreStable},
+         "ids are made up, or taken from the clock", OfEachContainer<IdsAreStable>},
         {"description-ids-differ",
          "Movies with different content get different ids, so a host keeps them apart.",
-         "ids are made of too little of the movie", IdsDiffer},
+         "ids are made of too little of the movie", OfEachContainer<IdsDiffer>},
         {"description-slots", "Each mob of a description has slots.",
-         "a mob is added and its tracks are not", MobsHaveSlots},
+         "a mob is added and its tracks are not", OfEachContainer<MobsHaveSlots>},
         {"description-outlives", "A description goes on when its container is released.",
-         "the container closes the file at its end", OutlivesTheContainer},
+         "the container closes the file at its end", OfEachContainer<OutlivesTheContainer>},
         {"description-index",
          "A container's list refuses an index that is not there with NCF_E_NOTFOUND.",
-         "the index is not compared, or as an unsigned number", RefusesOtherIndexes},
+         "the index is not compared, or as an unsigned number",
+         OfEachContainer<RefusesOtherIndexes>},
     };
 }
 

@@ -45,6 +45,7 @@ void ObjectsLeaveNothing(Trial& trial) {
         ExpectNothingLeft(trial, "making and releasing an object of " + made.name, [&] {
             void* out = nullptr;
             const auto factory = FactoryOf(module, made.component);
+            trial.Expect(static_cast<bool>(factory), "a class factory, as before", "none");
             factory->CreateInstance(module.unknown(), nullptr, IID_INCFUnknown, &out);
             const auto object = host::Ref<INCFUnknown>::Adopt(static_cast<INCFUnknown*>(out));
             if (object) {
@@ -83,24 +84,24 @@ void RefusedCreationsLeaveNothing(Trial& trial) {
     });
 }
 
-void DescriptionsLeaveNothing(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void DescriptionsLeaveNothing(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     DescribeSound(containers, movie.file);
     ExpectNothingLeft(trial, "describing a movie",
                       [&] { Describe(trial, containers.Open(movie.file).get()); });
 }
 
-void BrokenFilesLeaveNothing(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteBrokenMovies(trial.folder())[2];
+void BrokenFilesLeaveNothing(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteBrokenMovies(containers.folder())[2];
     ExpectNothingLeft(trial, "describing a file that is no movie",
                       [&] { Describe(trial, containers.Open(movie.file).get()); });
 }
 
-void MappingsLeaveNothing(Trial& trial) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
+void MappingsLeaveNothing(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
     ExpectNothingLeft(trial, "asking for a movie's sample mapping", [&] {
         const auto container = containers.Open(movie.file);
         host::Ref<NMA::ISampleMapping> mapping;
@@ -111,8 +112,8 @@ void MappingsLeaveNothing(Trial& trial) {
     });
 }
 
-void VolumesLeaveNothing(Trial& trial) {
-    Volumes volumes(trial);
+void VolumesLeaveNothing(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     const auto path = host::ModulePath(volumes.folder());
     ExpectNothingLeft(trial, "asking a volume for a folder's info and clips", [&] {
         volumes.Claims(volumes.folder());
@@ -193,15 +194,15 @@ void CallsInAnyOrder(Trial& trial) {
     ExpectIdle(module, "when everything is released");
 }
 
-void ChangedMovies(Trial& trial) {
+void ChangedMovies(Containers& containers) {
     constexpr int kMovies = 300;
-    Containers containers(trial);
+    Trial& trial = containers.trial();
     const movies::Bytes whole = BytesOfSoundMovie();
     std::mt19937_64 numbers(trial.options().seed);
     for (int number = 1; number <= kMovies; ++number) {
         const SampleMovie movie{"changed movie " + std::to_string(number) + " of seed " +
                                     std::to_string(trial.options().seed),
-                                trial.folder() / "changed.mov"};
+                                containers.folder() / "changed.mov"};
         WriteBytes(Changed(whole, numbers), movie.file);
         DescribeAnything(containers, movie);
     }
@@ -224,19 +225,20 @@ std::vector<Check> EnduranceChecks() {
         {"leaks-refused-creation", "1000 creations that are refused leave nothing behind.", kLeak,
          RefusedCreationsLeaveNothing},
         {"leaks-descriptions", "Describing a movie 1000 times leaves nothing behind.", kLeak,
-         DescriptionsLeaveNothing},
+         OfEachContainer<DescriptionsLeaveNothing>},
         {"leaks-mappings", "1000 sample mappings of a movie leave nothing behind.", kLeak,
-         MappingsLeaveNothing},
+         OfEachContainer<MappingsLeaveNothing>},
         {"leaks-volumes", "Asking a volume for a folder 1000 times leaves nothing behind.", kLeak,
-         VolumesLeaveNothing},
+         OfEachVolume<VolumesLeaveNothing>},
         {"leaks-broken-files", "Refusing a file 1000 times leaves nothing behind.", kLeak,
-         BrokenFilesLeaveNothing},
+         OfEachContainer<BrokenFilesLeaveNothing>},
         {"fuzz-calls",
          "Objects are made, queried and released in any order, and all are gone in the end.",
          "objects share something that one of them takes away", CallsInAnyOrder, true},
         {"fuzz-movies",
          "Movies with changed bytes are described or refused; nothing is left of them.",
-         "a number of the file is used before it is compared with its size", ChangedMovies, true},
+         "a number of the file is used before it is compared with its size",
+         OfEachContainer<ChangedMovies>, true},
     };
 }
 

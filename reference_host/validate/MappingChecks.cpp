@@ -18,11 +18,6 @@ host::Ref<NMA::ISampleMapping> MappingOf(Trial& trial, NMA::IMediaContainer3* co
     return mapping;
 }
 
-host::Ref<NMA::ISampleMapping> MappingOf(Containers& containers,
-                                         const std::filesystem::path& movie) {
-    return MappingOf(containers.trial(), containers.Open(movie).get());
-}
-
 // A module that counts wrongly has another check against it.
 ncfUInt32 TracksOf(NMA::ISampleMapping& mapping) {
     return static_cast<ncfUInt32>(std::max<ncfSInt32>(mapping.GetNumberOfTracks(), 0));
@@ -42,12 +37,13 @@ ncfUInt32 TrackWithSamples(Trial& trial, NMA::ISampleMapping& mapping) {
 
 // Calls `visit` with each track of a sound movie that has samples, and their number. A mapping may
 // count tracks that have none, such as timecode.
-void ForEachTrack(Trial& trial,
+void ForEachTrack(Containers& containers,
                   const std::function<void(NMA::ISampleMapping&, ncfUInt32 track, ncfUInt64 samples,
                                            std::uintmax_t fileSize)>& visit) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
-    const auto mapping = MappingOf(containers, movie.file);
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
+    const auto container = containers.Open(movie.file);
+    const auto mapping = MappingOf(trial, container.get());
     const ncfUInt32 tracks = TracksOf(*mapping);
     bool isAny = false;
     for (ncfUInt32 track = 0; track < tracks; ++track) {
@@ -61,17 +57,19 @@ void ForEachTrack(Trial& trial,
     trial.Expect(isAny, "the number of samples of one track at least", "none is told");
 }
 
-void HasTracks(Trial& trial) {
-    Containers containers(trial);
-    const auto mapping = MappingOf(containers, WriteSoundMovie(trial.folder()).file);
+void HasTracks(Containers& containers) {
+    Trial& trial = containers.trial();
+    const auto container = containers.Open(WriteSoundMovie(containers.folder()).file);
+    const auto mapping = MappingOf(trial, container.get());
     trial.Doing("calling GetNumberOfTracks for a movie with picture and sound");
     const ncfSInt32 tracks = mapping->GetNumberOfTracks();
     trial.Expect(tracks >= 1, "one track at least", std::to_string(tracks));
 }
 
-void TracksHaveSamples(Trial& trial) {
-    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
-                            std::uintmax_t) {
+void TracksHaveSamples(Containers& containers) {
+    Trial& trial = containers.trial();
+    ForEachTrack(containers, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
+                                 std::uintmax_t) {
         trial.Expect(samples >= 1, "one sample at least", "none");
         trial.Doing("asking for the number of channels of track " + std::to_string(track));
         ncfUInt32 channels = 0;
@@ -80,9 +78,10 @@ void TracksHaveSamples(Trial& trial) {
     });
 }
 
-void SamplesLieInTheFile(Trial& trial) {
-    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
-                            std::uintmax_t fileSize) {
+void SamplesLieInTheFile(Containers& containers) {
+    Trial& trial = containers.trial();
+    ForEachTrack(containers, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
+                                 std::uintmax_t fileSize) {
         for (const ncfUInt64 sample : {ncfUInt64{0}, samples / 2, samples - 1}) {
             trial.Doing("asking where sample " + std::to_string(sample) + " of track " +
                         std::to_string(track) + " lies");
@@ -97,9 +96,10 @@ void SamplesLieInTheFile(Trial& trial) {
     });
 }
 
-void RefusesOtherTracks(Trial& trial) {
-    Containers containers(trial);
-    const auto mapping = MappingOf(containers, WriteSoundMovie(trial.folder()).file);
+void RefusesOtherTracks(Containers& containers) {
+    Trial& trial = containers.trial();
+    const auto container = containers.Open(WriteSoundMovie(containers.folder()).file);
+    const auto mapping = MappingOf(trial, container.get());
     const ncfUInt32 tracks = TracksOf(*mapping);
     for (const ncfUInt32 track : {tracks, 0x7FFFFFFFu, 0xFFFFFFFFu}) {
         trial.Doing("asking for samples of track " + std::to_string(track) + " of " +
@@ -116,9 +116,10 @@ void RefusesOtherTracks(Trial& trial) {
     }
 }
 
-void MappingRefusesNull(Trial& trial) {
-    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64,
-                            std::uintmax_t) {
+void MappingRefusesNull(Containers& containers) {
+    Trial& trial = containers.trial();
+    ForEachTrack(containers, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64,
+                                 std::uintmax_t) {
         trial.Doing("asking about track " + std::to_string(track) + " with null for the output");
         trial.ExpectRefusal(mapping.GetNumberOfChannels(track, nullptr));
         trial.ExpectRefusal(mapping.GetNumberOfSamples(track, nullptr));
@@ -131,9 +132,10 @@ void MappingRefusesNull(Trial& trial) {
     });
 }
 
-void RefusesOtherSamples(Trial& trial) {
-    ForEachTrack(trial, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
-                            std::uintmax_t fileSize) {
+void RefusesOtherSamples(Containers& containers) {
+    Trial& trial = containers.trial();
+    ForEachTrack(containers, [&](NMA::ISampleMapping& mapping, ncfUInt32 track, ncfUInt64 samples,
+                                 std::uintmax_t fileSize) {
         trial.Doing("asking where sample " + std::to_string(samples) + " of track " +
                     std::to_string(track) + " lies, one beyond the last");
         ncfUInt64 position = 0;
@@ -144,10 +146,11 @@ void RefusesOtherSamples(Trial& trial) {
     });
 }
 
-void MappingRefused(Trial& trial, Refused refused) {
-    Containers containers(trial);
-    const SampleMovie movie = WriteSoundMovie(trial.folder());
-    MappingOf(containers, movie.file);
+template <Refused refused>
+void MappingRefused(Containers& containers) {
+    Trial& trial = containers.trial();
+    const SampleMovie movie = WriteSoundMovie(containers.folder());
+    MappingOf(trial, containers.Open(movie.file).get());
     RefuseEach(
         containers.module(), refused,
         [&](int number) {
@@ -169,17 +172,9 @@ void MappingRefused(Trial& trial, Refused refused) {
                         "success, as before the refusals");
 }
 
-void CreationsRefusedInMapping(Trial& trial) {
-    MappingRefused(trial, Refused::kCreations);
-}
-
-void QueriesRefusedInMapping(Trial& trial) {
-    MappingRefused(trial, Refused::kQueries);
-}
-
-void MappingOutlivesTheContainer(Trial& trial) {
-    Containers containers(trial);
-    auto container = containers.Open(WriteSoundMovie(trial.folder()).file);
+void MappingOutlivesTheContainer(Containers& containers) {
+    Trial& trial = containers.trial();
+    auto container = containers.Open(WriteSoundMovie(containers.folder()).file);
     const auto mapping = MappingOf(trial, container.get());
     const ncfUInt32 track = TrackWithSamples(trial, *mapping);
     container.Reset();
@@ -197,30 +192,30 @@ std::vector<Check> MappingChecks() {
         "a result is not looked at, or the output is set although a later step fails";
     return {
         {"mapping-tracks", "A movie with picture and sound has tracks in its sample mapping.",
-         "the answer is a result instead of the number", HasTracks},
+         "the answer is a result instead of the number", OfEachContainer<HasTracks>},
         {"mapping-samples", "Each track of a mapping tells how many samples and channels it has.",
-         "an output is left as it was", TracksHaveSamples},
+         "an output is left as it was", OfEachContainer<TracksHaveSamples>},
         {"mapping-in-file", "The samples of a mapping lie within the movie's file.",
-         "positions are those of a chunk or of the media", SamplesLieInTheFile},
+         "positions are those of a chunk or of the media", OfEachContainer<SamplesLieInTheFile>},
         {"mapping-other-tracks", "A mapping refuses a track that is not there.",
-         "the number is not compared", RefusesOtherTracks},
+         "the number is not compared", OfEachContainer<RefusesOtherTracks>},
         {"mapping-other-samples",
          "For a sample beyond the last, a mapping names no place outside of the file.",
-         "the number is not compared", RefusesOtherSamples},
+         "the number is not compared", OfEachContainer<RefusesOtherSamples>},
         {"mapping-null-outputs", "A mapping refuses null for an output.",
-         "the output is used before it is looked at", MappingRefusesNull},
+         "the output is used before it is looked at", OfEachContainer<MappingRefusesNull>},
         {"mapping-creations-refused",
          "When the host refuses to make the n-th component that a sample mapping asks for, for "
          "every n, it is made or refused, and the next one works.",
-         kRefusal, CreationsRefusedInMapping},
+         kRefusal, OfEachContainer<MappingRefused<Refused::kCreations>>},
         {"mapping-queries-refused",
          "When the host refuses the n-th interface that a sample mapping asks for, for every n, "
          "it is made or refused, and the next one works.",
-         kRefusal, QueriesRefusedInMapping},
+         kRefusal, OfEachContainer<MappingRefused<Refused::kQueries>>},
         {"mapping-outlives",
          "A mapping goes on when its container is released, and counts as "
          "alive.",
-         "the mapping points into the container", MappingOutlivesTheContainer},
+         "the mapping points into the container", OfEachContainer<MappingOutlivesTheContainer>},
     };
 }
 

@@ -2,6 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/validate/Media.h"
 
+#include <algorithm>
+#include <utility>
+
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/util/text/HostText.h"
 
@@ -20,38 +23,81 @@ bool ClaimsMovies(NMA::IMediaContainer3* container) {
     return false;
 }
 
-}  // namespace
-
-host::Ref<INCFClassFactory> FactoryOfMedia(Module& module, const GUID& interfaceId,
-                                           const char* what) {
-    for (const host::ComponentFacts& component : module.Components()) {
-        host::Ref<INCFClassFactory> factory = FactoryOf(module, component);
-        if (!factory) {
-            continue;
-        }
-        void* out = nullptr;
-        const NCFRESULT result =
-            factory->CreateInstance(module.unknown(), nullptr, interfaceId, &out);
-        const auto made = host::Ref<INCFUnknown>::Adopt(static_cast<INCFUnknown*>(out));
-        if (result >= 0 && made) {
-            return factory;
-        }
-    }
-    module.trial().Skip(std::string("the module has no ") + what);
+bool DoesClaim(Trial& trial, NMA::IMediaVolume& volume, const std::filesystem::path& folder) {
+    const auto path = host::ModulePath(folder);
+    const NCFRESULT result = volume.IsMediaVolume(path.get());
+    trial.Expect(result == 0 || result == 1, "1 or 0, whatever happens", trial.Text(result));
+    return result == 1;
 }
 
-Containers::Containers(Trial& trial, const std::function<void(host::Host&)>& prepare)
-    : module_(trial) {
+// An empty folder for the component with this number.
+std::filesystem::path FolderOf(const Trial& trial, std::size_t number) {
+    const std::filesystem::path folder = trial.folder() / std::to_string(number);
+    MakeFolder(folder);
+    return folder;
+}
+
+// One of those that take the movies, and how many do. What the check does with it is told with its
+// name, unless it is the only one. The check is skipped where there is none.
+template <class Component, class Takes>
+std::pair<Component, std::size_t> Choose(Trial& trial, std::vector<Component> components,
+                                         std::size_t number, const Takes& takes,
+                                         const char* otherwise) {
+    components.erase(
+        std::remove_if(components.begin(), components.end(),
+                       [&](const Component& component) { return !takes(component.object.get()); }),
+        components.end());
+    if (number >= components.size()) {
+        trial.Skip(otherwise);
+    }
+    if (components.size() > 1) {
+        trial.With(components[number].name);
+    }
+    return {components[number], components.size()};
+}
+
+// Does a check with one component after the other; `check` tells how many there are.
+void OneByOne(Trial& trial,
+              const std::function<void(std::size_t number, std::size_t& count)>& check) {
+    std::size_t count = 1;
+    std::vector<std::string> reasons;
+    for (std::size_t number = 0; number < count; ++number) {
+        trial.With({});
+        const auto skipped = trial.Part([&] { check(number, count); });
+        if (skipped) {
+            reasons.push_back(*skipped);
+        }
+    }
+    if (reasons.size() == count) {
+        trial.Skip(reasons[0]);
+    }
+}
+
+}  // namespace
+
+Containers::Containers(Trial& trial, std::size_t number,
+                       const std::function<void(host::Host&)>& prepare)
+    : module_(trial), folder_(FolderOf(trial, number)) {
     if (prepare) {
         prepare(module_.host());
     }
     module_.Start();
-    module_.OfferComponents();
-    trial.Doing("looking for a component that is a container");
-    factory_ = FactoryOfMedia(module_, NMA::IID_IMediaContainer3, "container");
-    if (!ClaimsMovies(New().get())) {
-        trial.Skip("the module's container does not claim *.mov, and other files are not made");
+    const auto [chosen, count] =
+        Choose(trial, MediaOf<NMA::IMediaContainer3>(module_, "container"), number, ClaimsMovies,
+               "the module's container does not claim *.mov, and other files are not made");
+    factory_ = chosen.factory;
+    count_ = count;
+}
+
+host::Ref<NMA::IMediaContainer3> Containers::New() {
+    void* out = nullptr;
+    const NCFRESULT result =
+        factory_->CreateInstance(module_.unknown(), nullptr, NMA::IID_IMediaContainer3, &out);
+    auto made = host::Ref<NMA::IMediaContainer3>::Adopt(static_cast<NMA::IMediaContainer3*>(out));
+    if (result < 0 || !made) {
+        trial().Skip("its object can't be made: " + trial().Text(result));
     }
+    return made;
 }
 
 host::Ref<NMA::IMediaContainer3> Containers::Open(const std::filesystem::path& file) {
@@ -78,6 +124,15 @@ host::Ref<NMA::IMediaContainer3> Containers::TryToOpen(const std::filesystem::pa
         container.Reset();
     }
     return container;
+}
+
+void ForEachContainer(Trial& trial, const std::function<void(Containers&)>& check,
+                      const std::function<void(host::Host&)>& prepare) {
+    OneByOne(trial, [&](std::size_t number, std::size_t& count) {
+        Containers containers(trial, number, prepare);
+        count = containers.count();
+        check(containers);
+    });
 }
 
 Described Describe(Trial& trial, NMA::IMediaContainer3* container) {
@@ -133,24 +188,29 @@ bool IsSupported(Trial& trial, NMA::IMediaContainer3* container) {
     }
 }
 
-Volumes::Volumes(Trial& trial) : module_(trial), folder_(trial.folder() / "movies") {
+Volumes::Volumes(Trial& trial, std::size_t number)
+    : module_(trial), scratch_(FolderOf(trial, number)), folder_(scratch_ / "movies") {
     module_.Start();
-    module_.OfferComponents();
-    trial.Doing("looking for a component that is a volume");
-    const auto factory = FactoryOfMedia(module_, NMA::IID_IMediaVolume, "volume");
-    volume_ = Make<NMA::IMediaVolume>(module_, factory.get());
     MakeFolder(folder_);
     movies_ = WriteSoundMovies(folder_);
-    if (!Claims(folder_)) {
-        trial.Skip("the module's volume does not claim a folder of *.mov, and others are not made");
-    }
+    const auto [chosen, count] = Choose(
+        trial, MediaOf<NMA::IMediaVolume>(module_, "volume"), number,
+        [&](NMA::IMediaVolume* volume) { return DoesClaim(trial, *volume, folder_); },
+        "the module's volume does not claim a folder of *.mov, and others are not made");
+    volume_ = chosen.object;
+    count_ = count;
 }
 
 bool Volumes::Claims(const std::filesystem::path& folder) {
-    const auto path = host::ModulePath(folder);
-    const NCFRESULT result = volume_->IsMediaVolume(path.get());
-    trial().Expect(result == 0 || result == 1, "1 or 0, whatever happens", trial().Text(result));
-    return result == 1;
+    return DoesClaim(trial(), *volume_, folder);
+}
+
+void ForEachVolume(Trial& trial, const std::function<void(Volumes&)>& check) {
+    OneByOne(trial, [&](std::size_t number, std::size_t& count) {
+        Volumes volumes(trial, number);
+        count = volumes.count();
+        check(volumes);
+    });
 }
 
 host::Ref<NMA::IAAFClips> Volumes::ClipsOf(const std::filesystem::path& folder) {

@@ -29,8 +29,20 @@ std::unique_ptr<host::Host> Trial::NewHost() const {
 }
 
 void Trial::Doing(std::string step) {
-    step_ = std::move(step);
+    step_ = with_.empty() ? std::move(step) : with_ + ": " + step;
     tell_(step_);
+}
+
+std::optional<std::string> Trial::Part(const std::function<void()>& part) const {
+    try {
+        part();
+    } catch (const Ended& ended) {
+        if (ended.verdict != Verdict::kSkipped) {
+            throw;
+        }
+        return ended.found;
+    }
+    return {};
 }
 
 void Trial::Fail(std::string expected, std::string found, std::string cause) const {

@@ -53,6 +53,12 @@ public:
     // From now on the module is given this to do: "calling NCFStartup".
     void Doing(std::string step);
 
+    // From now on each step is told with this before it, such as the component it is done with.
+    void With(std::string what) { with_ = std::move(what); }
+
+    // Does a part of the check that may be skipped without the rest. Why it was, if it was.
+    std::optional<std::string> Part(const std::function<void()>& part) const;
+
     // Each ends the check. Without a cause, that of the check's row is told.
     [[noreturn]] void Fail(std::string expected, std::string found, std::string cause = {}) const;
     [[noreturn]] void Skip(std::string why) const;
@@ -68,6 +74,7 @@ public:
 private:
     const TrialOptions& options_;
     Tell tell_;
+    std::string with_;
     std::string step_;
     std::optional<Outcome> warning_;
 };

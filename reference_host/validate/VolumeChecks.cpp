@@ -10,34 +10,34 @@ namespace validate {
 namespace {
 
 void ClaimsAFolder(Trial& trial) {
-    Containers containers(trial);  // a module without them has volumes of something else
-    Module& module = containers.module();
-    trial.Doing("looking for a component that is a volume");
-    const auto factory = FactoryOfMedia(module, NMA::IID_IMediaVolume, "volume");
-    const auto volume = Make<NMA::IMediaVolume>(module, factory.get());
-    WriteSoundMovies(trial.folder());
+    Containers containers(trial, 0);  // a module without them has volumes of something else
+    const auto volumes = MediaOf<NMA::IMediaVolume>(containers.module(), "volume");
+    WriteSoundMovies(containers.folder());
+    const auto path = host::ModulePath(containers.folder());
     trial.Doing("calling IsMediaVolume with a folder of sound movies");
-    const auto path = host::ModulePath(trial.folder());
-    trial.ExpectResult(1, volume->IsMediaVolume(path.get()),
-                       "1, since the module's container claims *.mov");
+    NCFRESULT result = 0;
+    for (std::size_t i = 0; i < volumes.size() && result != 1; ++i) {
+        result = volumes[i].object->IsMediaVolume(path.get());
+    }
+    trial.ExpectResult(1, result, "1, since the module's container claims *.mov");
 }
 
-void ClaimsAFolderEachTime(Trial& trial) {
-    Volumes volumes(trial);
+void ClaimsAFolderEachTime(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     for (int round = 2; round <= 20; ++round) {
         trial.Doing("calling IsMediaVolume with the same folder, time " + std::to_string(round));
         trial.Expect(volumes.Claims(volumes.folder()), "1, as the first time", "0");
     }
 }
 
-void LeavesOtherFolders(Trial& trial) {
-    Volumes volumes(trial);
-    const std::filesystem::path empty = trial.folder() / "empty";
+void LeavesOtherFolders(Volumes& volumes) {
+    Trial& trial = volumes.trial();
+    const std::filesystem::path empty = volumes.scratch() / "empty";
     MakeFolder(empty);
     trial.Doing("calling IsMediaVolume with an empty folder");
     trial.Expect(!volumes.Claims(empty), "0", "1");
     trial.Doing("calling IsMediaVolume with a folder that is not there");
-    trial.Expect(!volumes.Claims(trial.folder() / "absent"), "0", "1");
+    trial.Expect(!volumes.Claims(volumes.scratch() / "absent"), "0", "1");
     trial.Doing("calling IsMediaVolume with a movie instead of a folder");
     trial.Expect(!volumes.Claims(volumes.movies()[0].file), "0", "1");
 }
@@ -79,14 +79,14 @@ void VolumeRefusesNullOutputs(Trial& trial, Volumes& volumes) {
     trial.ExpectRefusal(clips->GetMetadata(0, nullptr));
 }
 
-void VolumeRefusesNull(Trial& trial) {
-    Volumes volumes(trial);
+void VolumeRefusesNull(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     VolumeRefusesNullPaths(trial, *volumes.volume());
     VolumeRefusesNullOutputs(trial, volumes);
 }
 
-void TellsOfAFolder(Trial& trial) {
-    Volumes volumes(trial);
+void TellsOfAFolder(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     trial.Doing("calling GetVolumeInfo with a folder of movies");
     const auto path = host::ModulePath(volumes.folder());
     host::Ref<NMA::IVolumeInfo> info;
@@ -108,8 +108,8 @@ void TellsOfAFolder(Trial& trial) {
     trial.Expect(date != 0, "a date, since there are movies", "0");
 }
 
-void FormatListsClips(Trial& trial) {
-    Volumes volumes(trial);
+void FormatListsClips(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     trial.Doing("listing the clips of a folder of movies");
     const auto clips = volumes.ClipsOf(volumes.folder());
     trial.Expect(clips->GetCount() >= 1, "one clip at least, since the folder is claimed",
@@ -124,8 +124,8 @@ std::filesystem::path PathOfClip(Trial& trial, NMA::IAAFClips* clips, ncfSInt32 
     return path;
 }
 
-void ClipsAreTheFoldersFiles(Trial& trial) {
-    Volumes volumes(trial);
+void ClipsAreTheFoldersFiles(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     const auto clips = volumes.ClipsOf(volumes.folder());
     std::set<std::filesystem::path> files;
     for (const SampleMovie& movie : volumes.movies()) {
@@ -139,8 +139,8 @@ void ClipsAreTheFoldersFiles(Trial& trial) {
     }
 }
 
-void ListRefusesOtherIndexes(Trial& trial) {
-    Volumes volumes(trial);
+void ListRefusesOtherIndexes(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     const auto clips = volumes.ClipsOf(volumes.folder());
     for (const ncfSInt32 index : {clips->GetCount(), -1, 0x7FFFFFFF}) {
         trial.Doing("asking a folder's list for clip " + std::to_string(index) + " of " +
@@ -151,8 +151,8 @@ void ListRefusesOtherIndexes(Trial& trial) {
     }
 }
 
-void ListDescribesClips(Trial& trial) {
-    Volumes volumes(trial);
+void ListDescribesClips(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     const auto clips = volumes.ClipsOf(volumes.folder());
     for (ncfSInt32 i = 0; i < clips->GetCount(); ++i) {
         trial.Doing("asking a folder's list for the description of clip " + std::to_string(i));
@@ -164,8 +164,8 @@ void ListDescribesClips(Trial& trial) {
     }
 }
 
-void ContainerIdLeadsToAContainer(Trial& trial) {
-    Volumes volumes(trial);
+void ContainerIdLeadsToAContainer(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     trial.Doing("calling GetContainerComponentId");
     GUID id{};
     trial.ExpectSuccess(volumes.volume()->GetContainerComponentId(&id));
@@ -187,9 +187,9 @@ void ContainerIdLeadsToAContainer(Trial& trial) {
     trial.Fail("the component id of one of the module's components", "an id that none has");
 }
 
-void GoesOnWithBadFiles(Trial& trial) {
-    Volumes volumes(trial);
-    const std::filesystem::path folder = trial.folder() / "bad";
+void GoesOnWithBadFiles(Volumes& volumes) {
+    Trial& trial = volumes.trial();
+    const std::filesystem::path folder = volumes.scratch() / "bad";
     MakeFolder(folder);
     WriteBrokenMovies(folder);
     WriteHostileMovies(folder);
@@ -229,8 +229,9 @@ void ListAnyway(Trial& trial, Volumes& volumes) {
     trial.Expect(!hasClips || clips, "a list with success", "null");
 }
 
-void ListingRefused(Trial& trial, Refused refused) {
-    Volumes volumes(trial);
+template <Refused refused>
+void ListingRefused(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     const ncfSInt32 before = volumes.ClipsOf(volumes.folder())->GetCount();
     RefuseEach(
         volumes.module(), refused,
@@ -245,16 +246,8 @@ void ListingRefused(Trial& trial, Refused refused) {
     trial.Expect(after == before, "as many clips as before the refusals", std::to_string(after));
 }
 
-void CreationsRefusedInListing(Trial& trial) {
-    ListingRefused(trial, Refused::kCreations);
-}
-
-void QueriesRefusedInListing(Trial& trial) {
-    ListingRefused(trial, Refused::kQueries);
-}
-
-void ListOutlivesVolume(Trial& trial) {
-    Volumes volumes(trial);
+void ListOutlivesVolume(Volumes& volumes) {
+    Trial& trial = volumes.trial();
     const auto clips = volumes.ClipsOf(volumes.folder());
     volumes.Release();
     trial.Doing("using a folder's list after its volume's end");
@@ -271,45 +264,47 @@ std::vector<Check> VolumeChecks() {
          "the folder's entries are compared in another case, or the path is not understood",
          ClaimsAFolder},
         {"volume-claims-again", "A volume says the same of a folder each time.",
-         "the first answer is kept, or changes something", ClaimsAFolderEachTime},
+         "the first answer is kept, or changes something", OfEachVolume<ClaimsAFolderEachTime>},
         {"volume-other-folders",
          "A volume answers 0 for an empty folder, for one that is not there and for a file.",
          "a failure is handed on instead of 0, or the folder is not looked into",
-         LeavesOtherFolders},
+         OfEachVolume<LeavesOtherFolders>},
         {"volume-null-arguments",
          "A volume and what it hands out refuse null for a path and for an output.",
-         "the argument is used before it is looked at", VolumeRefusesNull},
+         "the argument is used before it is looked at", OfEachVolume<VolumeRefusesNull>},
         {"volume-info",
          "A claimed folder has a volume info with type, serial number, label and date.",
-         "an output is left as it was", TellsOfAFolder},
+         "an output is left as it was", OfEachVolume<TellsOfAFolder>},
         {"volume-format", "A claimed folder has a format that lists one clip at least.",
-         "the claim and the list go by different rules", FormatListsClips},
+         "the claim and the list go by different rules", OfEachVolume<FormatListsClips>},
         {"volume-clip-paths", "Each clip of a folder's list is another file of that folder.",
          "paths are joined with another separator than a backslash, or a file is listed twice",
-         ClipsAreTheFoldersFiles},
+         OfEachVolume<ClipsAreTheFoldersFiles>},
         {"volume-clip-index",
          "A folder's list refuses an index that is not there with NCF_E_NOTFOUND.",
-         "the index is not compared, or as an unsigned number", ListRefusesOtherIndexes},
+         "the index is not compared, or as an unsigned number",
+         OfEachVolume<ListRefusesOtherIndexes>},
         {"volume-clip-descriptions",
          "A folder's list gives a description with success, and null with a failure.", kPair,
-         ListDescribesClips},
+         OfEachVolume<ListDescribesClips>},
         {"volume-container-id",
          "GetContainerComponentId names a component of the module that is a container.",
-         "it gives the class id, or the id of another component", ContainerIdLeadsToAContainer},
+         "it gives the class id, or the id of another component",
+         OfEachVolume<ContainerIdLeadsToAContainer>},
         {"volume-bad-files",
          "A folder with broken and hostile files is listed, and each of them refused or "
          "described.",
-         "what stands in a file is used before it is looked at", GoesOnWithBadFiles},
+         "what stands in a file is used before it is looked at", OfEachVolume<GoesOnWithBadFiles>},
         {"volume-creations-refused",
          "When the host refuses to make the n-th component that listing a folder asks for, for "
          "every n, the folder is listed or refused, and the next one works.",
-         kPair, CreationsRefusedInListing},
+         kPair, OfEachVolume<ListingRefused<Refused::kCreations>>},
         {"volume-queries-refused",
          "When the host refuses the n-th interface that listing a folder asks for, for every n, "
          "the folder is listed or refused, and the next one works.",
-         kPair, QueriesRefusedInListing},
+         kPair, OfEachVolume<ListingRefused<Refused::kQueries>>},
         {"volume-released-first", "A folder's list goes on when its volume is released.",
-         "the list points into the volume or the format", ListOutlivesVolume},
+         "the list points into the volume or the format", OfEachVolume<ListOutlivesVolume>},
     };
 }
 

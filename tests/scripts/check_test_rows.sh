@@ -2,8 +2,8 @@
 # Copyright (c) 2026 The Cliphost authors
 # SPDX-License-Identifier: MIT
 #
-# check_test_rows.sh TESTROWS CTEST: ctest's rows of a program are those that it lists, and a program
-# that lists none is an error.
+# check_test_rows.sh TESTROWS CTEST: ctest's rows of a program are those that it lists; one that ends with 77 is
+# skipped, and a program that lists none is an error.
 set -euo pipefail
 rows_script=$1 ctest=$2
 folder=$(mktemp -d)
@@ -33,6 +33,12 @@ for row in test_some.First Apart.Three; do
 done
 grep -q '^Total Tests: 2$' <<<"$listed" || fail "other rows: $listed"
 [ "$(echo test_some_rows*)" = test_some_rows.cmake ] || fail "left over: $(echo test_some_rows*)"
+
+printf '#!/bin/sh\n[ "$1" = --gtest_list_tests ] && printf "First.\\n  One\\n" && exit\necho no browser\nexit 77\n' >test_some
+rm -f test_some_rows.cmake
+said=$("$ctest" -V 2>&1) || fail "a row that is skipped fails: $said"
+grep -q 'test_some.First .*Skipped' <<<"$said" || fail "a row that is skipped counts as another: $said"
+grep -q 'no browser' <<<"$said" || fail "a row that is skipped does not say why: $said"
 
 program
 if said=$("$ctest" 2>&1); then

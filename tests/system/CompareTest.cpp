@@ -214,14 +214,35 @@ TEST_F(CompareVerb, TellsWhichFileCanNotBeRead) {
     std::ofstream(folder() / "text.aaf") << "not an AAF file";
     const std::string good = In("a.aaf") + " ";
     ExpectSays(RunCliphost("compare " + good + In("text.aaf")), 1,
-               "text.aaf: can't be read as AAF: AAFRESULT_NOT_AAF_FILE");
-    ExpectSays(RunCliphost("compare " + In("text.aaf") + " " + good), 1, "text.aaf: can't be read");
-    ExpectSays(RunCliphost("compare " + good + In("none.aaf")), 2, "there is no such file");
+               "text.aaf: not compared: can't be read as AAF: AAFRESULT_NOT_AAF_FILE");
+    ExpectSays(RunCliphost("compare " + In("text.aaf") + " " + good), 1,
+               "text.aaf: not compared: can't be read");
+    ExpectSays(RunCliphost("compare " + good + In("none.aaf")), 2,
+               "none.aaf: not compared: there is no such file");
     ExpectSays(RunCliphost("compare " + good + In("")), 2, "this is a folder; give an AAF file");
     ExpectSays(RunCliphost("compare " + good), 2, "after is required");
     const CommandResult json = Answer("compare --json " + good + In("text.aaf"));
     EXPECT_EQ(json.status, 1);
     EXPECT_EQ(Json::parse(json.out)["afterFile"], (folder() / "text.aaf").string());
+    const std::string reason = Json::parse(json.out)["reason"];
+    EXPECT_EQ(reason.rfind("not compared: can't be read as AAF: AAFRESULT_NOT_AAF_FILE", 0), 0u)
+        << reason;
+}
+
+// Both have status 1.
+TEST_F(CompareVerb, TellsDifferencesFromAFileThatCanNotBeRead) {
+    Describe(Movie("a.mov", 10), "--aaf " + In("a.aaf"));
+    Describe(Movie("b.mov", 12), "--aaf " + In("b.aaf"));
+    std::ofstream(folder() / "text.aaf") << "not an AAF file";
+    const std::string call = "compare " + In("a.aaf") + " ";
+    const CommandResult differ = Answer(call + In("b.aaf"));
+    EXPECT_EQ(differ.status, 1);
+    EXPECT_NE(differ.out.find("differences: "), std::string::npos) << differ.out;
+    const CommandResult unread = Answer(call + In("text.aaf"));
+    EXPECT_EQ(unread.status, 1);
+    EXPECT_EQ(unread.out, "");
+    EXPECT_TRUE(Json::parse(Answer(call + In("b.aaf") + " --json").out).contains("counts"));
+    EXPECT_FALSE(Json::parse(Answer(call + In("text.aaf") + " --json").out).contains("counts"));
 }
 
 TEST_F(CompareVerb, EndsWithADocumentedStatusOnDamagedFiles) {

@@ -6,7 +6,9 @@
 #include <cmath>
 #include <fstream>
 #include <functional>
+#include <map>
 #include <nlohmann/json.hpp>
+#include <regex>
 #include <set>
 #include <sstream>
 
@@ -64,8 +66,35 @@ protected:
         return files;
     }
 
+    // Of each file of a folder.
+    std::map<std::string, std::string> ContentOf(const std::string& name) {
+        std::map<std::string, std::string> content;
+        for (const std::string& file : FilesIn(name)) {
+            content[file] = TextOfFile(folder() / name / file);
+        }
+        return content;
+    }
+
     int status = -1;
 };
+
+// "00001-strip-0f3a52b1c9d4.webp" as "00001-strip.webp".
+std::set<std::string> WithoutDigests(const std::set<std::string>& files) {
+    std::set<std::string> names;
+    for (const std::string& file : files) {
+        names.insert(std::regex_replace(file, std::regex("-[0-9a-f]{12}\\."), "."));
+    }
+    return names;
+}
+
+std::set<std::string> PicturesOf(const std::vector<int>& clips) {
+    std::set<std::string> names;
+    for (const int clip : clips) {
+        names.insert("0000" + std::to_string(clip) + "-poster.webp");
+        names.insert("0000" + std::to_string(clip) + "-strip.webp");
+    }
+    return names;
+}
 
 std::set<std::string> TraitsOf(const Json& clip) {
     std::set<std::string> ids;
@@ -518,13 +547,14 @@ TEST_F(Reports, PutPicturesIntoAFolderBesideThePage) {
     Copy("h264_with_aac.mov", "in/a.mov");
     Copy("rotated_270.mov", "in/b.mov");
     ExpectSays(Run("in -o 'my report.html' --split"), 0, "2 clips");
-    const std::set<std::string> both = {"00000-poster.webp", "00000-strip.webp",
-                                        "00001-poster.webp", "00001-strip.webp"};
-    EXPECT_EQ(FilesIn("my report_files"), both);
-    EXPECT_EQ(TextOfFile(folder() / "my report_files/00000-poster.webp").substr(8, 4), "WEBP");
+    const std::set<std::string> files = FilesIn("my report_files");
+    EXPECT_EQ(WithoutDigests(files), PicturesOf({0, 1}));
     const std::string page = TextOfFile(folder() / "my report.html");
     EXPECT_EQ(page.find("\"data\":\""), std::string::npos);
-    EXPECT_NE(page.find("my%20report_files/00000-poster.webp"), std::string::npos);
+    for (const std::string& file : files) {
+        EXPECT_EQ(TextOfFile(folder() / "my report_files" / file).substr(8, 4), "WEBP");
+        EXPECT_NE(page.find("my%20report_files/" + file), std::string::npos) << file;
+    }
 }
 
 // As a page of 1,000 clips has to stay below 60 MB.
@@ -548,15 +578,37 @@ TEST_F(Reports, RemoveThePicturesOfAnEarlierPageAndNoOtherFile) {
     Copy("pcm_u8.mov", "in/b.mov");  // has none
     Copy("rotated_270.mov", "in/c.mov");
     ExpectSays(Run("in -o r.html --split"), 0, "3 clips");
-    const std::set<std::string> both = {"00000-poster.webp", "00000-strip.webp",
-                                        "00002-poster.webp", "00002-strip.webp"};
-    EXPECT_EQ(FilesIn("r_files"), both);
-    const std::set<std::string> others = {"00009-poster.txt", "notes.webp", "9-strip.webp"};
+    EXPECT_EQ(WithoutDigests(FilesIn("r_files")), PicturesOf({0, 2}));
+    const std::set<std::string> others = {"00009-poster.txt",  "notes.webp",
+                                          "9-strip.webp",      "00009-poster-12.webp",
+                                          "00009-stripe.webp", "00009-poster-0123456789xy.webp"};
     for (const std::string& other : others) {
         std::ofstream(folder() / "r_files" / other) << "mine";
     }
+    std::ofstream(folder() / "r_files/00009-poster.webp") << "of an earlier version's page";
     ExpectSays(Run("in/b.mov -o r.html --split"), 0, "1 clip");
     EXPECT_EQ(FilesIn("r_files"), others);
+}
+
+// The page's last step is to take the place of the earlier one.
+TEST_F(Reports, LeaveTheEarlierPageAndItsPicturesWhereTheNewOneCanNotTakeItsPlace) {
+    Copy("h264_with_aac.mov", "in/a.mov");
+    Copy("h264_with_aac.mov", "in/b.mov");
+    ExpectSays(Run("in -o r.html --split"), 0, "2 clips");
+    const auto before = ContentOf("r_files");
+    Copy("rotated_270.mov", "in/a.mov");  // b.mov's pictures stay the same
+    std::ofstream(folder() / "other") << "other";
+    const std::string page = Quoted(folder() / "r.html");
+    if (RunCommand("mount --bind " + Quoted(folder() / "other") + " " + page + " 2>&1").status) {
+        GTEST_SKIP() << "no file can be mounted here";
+    }
+    const CommandResult failed = Run("in -o r.html --split");
+    EXPECT_EQ(RunCommand("umount " + page).status, 0);
+    ExpectSays(failed, 2, "r.html: not written: ");
+    EXPECT_EQ(ContentOf("r_files"), before);
+    ExpectSays(Run("in -o r.html --split"), 0, "2 clips");
+    EXPECT_NE(ContentOf("r_files"), before);
+    EXPECT_EQ(WithoutDigests(FilesIn("r_files")), PicturesOf({0, 1}));
 }
 
 TEST_F(Reports, GoToStandardOutputWhole) {

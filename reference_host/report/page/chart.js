@@ -8,8 +8,8 @@ function sizeChart(track) {
   const count = track.sizes.length;
   return el('figure', {class: 'chart'},
     el('figcaption', {}, el('span', {}, 'Size of samples over time'),
-      el('span', {class: 'fine'}, 'up to ' + bytesText(most) +
-        (track.samples > count ? ', means of ' + counted(Math.round(track.samples / count), 'sample') : ''))),
+      line('span', {class: 'fine'}, 'up to ', value(bytesText(most), 'Largest'), track.samples > count
+        ? [', means of ', value(counted(Math.round(track.samples / count), 'sample'), 'Means of')] : '')),
     svg('svg', {viewBox: '0 0 ' + count + ' 100', preserveAspectRatio: 'none', role: 'img',
                 'aria-label': 'Sizes of samples over time, from ' + bytesText(Math.min(...track.sizes)) +
                               ' to ' + bytesText(most)},
@@ -47,13 +47,12 @@ function sampleFacts(samples) {
 
 function interleaving(found) {
   if (!found) return [];
-  const words = 'Sound and picture of one time lie at most ' + plain(found.widest, 2) +
-                '\u00a0s of playing apart.';
-  return [el('h3', {}, 'Interleaving'), el('p', {}, words),
+  const words = ['Sound and picture of one time lie at most ',
+                 value(plain(found.widest, 2) + '\u00a0s', 'Apart'), ' of playing apart.'];
+  return [el('h3', {}, 'Interleaving'), line('p', {}, words),
     found.breaks.length === 0 ? '' : el('div', {class: 'wide'}, el('table', {class: 'small'},
-      el('caption', {}, 'Where they are more than 2 seconds apart' +
-        (found.count > found.breaks.length ? '. The first ' + found.breaks.length + ' of ' +
-                                             found.count.toLocaleString('en') : '')),
+      line('caption', {}, 'Where they are more than 2 seconds apart', found.count > found.breaks.length
+        ? ['. The first ' + found.breaks.length + ' of ', value(found.count.toLocaleString('en'), 'Places')] : ''),
       el('thead', {}, el('tr', {}, ['At byte', 'Track', 'At', 'Apart from', 'By'].map((title) =>
         el('th', {scope: 'col'}, title)))),
       roving(el('tbody', {}, found.breaks.map((one) => el('tr', {},

@@ -58,13 +58,22 @@ function roving(list, selector) {
   return list;
 }
 
+// Values within other words, which Tab reaches as one.
+function line(tag, properties, ...words) {
+  return roving(el(tag, properties, words), '.value');
+}
+
 // Rows of [label, value]; those without a value are left out.
-function facts(rows, properties) {
+function factRows(rows, properties) {
   const list = el('dl', {class: 'facts', ...properties});
   for (const [label, text] of rows) {
     if (text === undefined || text === '') continue;
     list.append(el('div', {}, el('dt', {}, label),
                    el('dd', {}, text instanceof Node ? text : value(text, label))));
   }
-  return roving(list, '.value');
+  return list;
+}
+
+function facts(rows, properties) {
+  return roving(factRows(rows, properties), '.value');
 }

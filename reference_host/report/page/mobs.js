@@ -40,12 +40,12 @@ function slotBox(slot, mobs) {
               ['Leads to', target < 0 ? 'nothing further'
                                       : mobTitle(mobs[target], target).toLowerCase() + ', slot ' + segment.SourceMobSlotID]);
   }
-  return el('li', {class: 'slot', 'data-slot': slot.SlotID,
+  return line('li', {class: 'slot', 'data-slot': slot.SlotID,
                    'data-mob': target < 0 ? undefined : target,
                    'data-target': target < 0 ? undefined : segment.SourceMobSlotID},
-    el('p', {class: 'slot-title'}, 'Slot ' + slot.SlotID, kind ? ' \u00b7 ' + kind : '',
+    el('p', {class: 'slot-title'}, 'Slot ', value(slot.SlotID, 'Slot'), kind ? ' \u00b7 ' + kind : '',
       plainText(slot.SlotName) ? [' \u00b7 ', name(plainText(slot.SlotName))] : ''),
-    facts(rows));
+    factRows(rows));
 }
 
 function mobBox(mob, place, mobs) {

@@ -11,6 +11,11 @@ function groupLabel(finding, group) {
        : group.label;
 }
 
+// Rates by their size; the others as they are told.
+function inOrder(finding) {
+  return finding.id === 'rates' ? [...finding.groups].sort((a, b) => ratio(a.label) - ratio(b.label)) : finding.groups;
+}
+
 function oddView(showOnly) {
   const heading = el('h1', {tabindex: '-1'}, 'What is odd');
   const view = el('article', {class: 'odd-view'}, heading,
@@ -22,7 +27,7 @@ function oddView(showOnly) {
       return el('section', {class: 'finding', 'aria-labelledby': 'odd-' + finding.id},
         el('h2', {id: 'odd-' + finding.id}, finding.title, ' ', el('span', {class: 'count'}, all.length)),
         el('p', {class: 'fine'}, finding.words),
-        el('ul', {class: 'groups'}, finding.groups.map((group) => el('li', {},
+        el('ul', {class: 'groups'}, inOrder(finding).map((group) => el('li', {},
           el('button', {type: 'button', class: 'chip',
                         onclick: () => showOnly(finding.title + ', ' + groupLabel(finding, group), group.clips)},
             groupLabel(finding, group), el('span', {class: 'count'}, group.clips.length)),

@@ -23,8 +23,8 @@ function filmstrip(strip) {
                     picture);
     cell.style.aspectRatio = strip.width + ' / ' + strip.height;
     list.append(el('li', {}, cell,
-      el('div', {class: 'under'}, value(frame.timecode || 'frame ' + frame.frame),
-        frame.timecode ? el('span', {class: 'fine'}, 'frame ' + frame.frame) : ''),
+      el('div', {class: 'under'}, frame.timecode ? value(frame.timecode) : '',
+        el('span', {class: 'fine'}, 'frame ', value(frame.frame, 'Frame'))),
       frame.problem ? el('p', {class: 'fine'}, frame.problem) : ''));
   });
   list.style.setProperty('--cell', strip.width + 'px');

@@ -13,8 +13,8 @@ function levelPath(levels) {
 }
 
 function waveform(wave, track) {
-  const highest = wave.highest !== undefined ? 'highest ' + plain(wave.highest, 1) + '\u00a0dB'
-                : wave.isWhole && !wave.lacksSamples ? 'silent' : 'nothing heard in what was read';
+  const level = wave.highest !== undefined ? plain(wave.highest, 1) + '\u00a0dB' : '';
+  const unheard = wave.isWhole && !wave.lacksSamples ? 'silent' : 'nothing heard in what was read';
   const title = 'Sound track ' + wave.track +
                 (track ? ', ' + counted(track.channels || 0, 'channel') : '');
   const width = Math.max(1, wave.peaks.length - 1);
@@ -22,9 +22,10 @@ function waveform(wave, track) {
       .filter(Boolean).join('; ');
   return el('figure', {class: 'wave'},
     el('figcaption', {}, el('span', {}, title),
-      el('span', {class: 'fine'}, highest + ', ' + durationText(wave.seconds) + (notes ? '; ' + notes : ''))),
+      line('span', {class: 'fine'}, level ? ['highest ', value(level, 'Highest')] : unheard, ', ',
+        value(durationText(wave.seconds), 'Length'), notes ? '; ' + notes : '')),
     svg('svg', {viewBox: '0 0 ' + width + ' ' + 2 * FULL, preserveAspectRatio: 'none', role: 'img',
-                'aria-label': title + ': ' + highest},
+                'aria-label': title + ': ' + (level ? 'highest ' + level : unheard)},
       svg('path', {class: 'peak', d: levelPath(wave.peaks)}),
       svg('path', {class: 'mean', d: levelPath(wave.means)}),
       svg('line', {class: 'middle', x1: 0, x2: width, y1: FULL, y2: FULL, 'vector-effect': 'non-scaling-stroke'})));

@@ -8,6 +8,7 @@ import shutil
 import tempfile
 
 SKIPPED = 77  # as ctest is told
+NEEDED = {"chromium": "chromium", "chromedriver": "chromium-driver", "pdftotext": "poppler-utils"}
 
 try:
     from selenium import webdriver
@@ -24,9 +25,9 @@ def why_none():
     """Why there is no browser; nothing where there is one."""
     if webdriver is None:
         return "Python has no selenium (Debian's python3-selenium)"
-    for program in ("chromium", "chromedriver"):
+    for program, package in NEEDED.items():
         if not shutil.which(program):
-            return f"there is no {program} (Debian's packages chromium and chromium-driver)"
+            return f"there is no {program} (Debian's package {package})"
     if os.geteuid() != 0:
         # Its sandbox needs what not every system lets its users have; without one it runs for root alone.
         try:
@@ -47,7 +48,11 @@ def start():
         options.add_argument("--no-sandbox")  # which Chromium has for other users alone
     options.set_capability("goog:loggingPrefs", {"browser": "ALL", "performance": "ALL"})
     service = Service(shutil.which("chromedriver"), env={**os.environ, "TMPDIR": temporary.name})
-    return Page(webdriver.Chrome(service=service, options=options), temporary)
+    try:
+        return Page(webdriver.Chrome(service=service, options=options), temporary)
+    except WebDriverException:
+        temporary.cleanup()
+        raise
 
 
 class Page:

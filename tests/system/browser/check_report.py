@@ -1,15 +1,12 @@
 #!/usr/bin/python3
 # Copyright (c) 2026 The Cliphost authors
 # SPDX-License-Identifier: MIT
-"""check_report.py CLIPHOST MOVIES WORK
+"""check_report.py CLIPHOST MOVIES
 
-Opens reports in Chromium and does what people do there. WORK is a folder that stays: what npm installs.
-Ends with status 77 where there is no browser.
+Opens reports in Chromium and does what people do there. Ends with status 77 where there is no browser.
 """
 
 import collections
-import shutil
-import subprocess
 import sys
 import tempfile
 import unittest
@@ -18,11 +15,11 @@ from pathlib import Path
 sys.dont_write_bytecode = True  # the modules lie in the sources
 import browser  # noqa: E402
 import pages  # noqa: E402
+from clip_parts import ClipParts  # noqa: E402, F401
+from printing import Printing  # noqa: E402, F401
+from report_test import NAMES, VIEWS, ReportTest  # noqa: E402
 
-HERE = Path(__file__).resolve().parent
-VIEWS = ("", "#/clip/1", "#/clip/8", "#/odd")
 WIDTHS = (360, 1440, 3840)
-NAMES = "tr.clip a.open"
 # The numbers of the clips in the table's order.
 PLACES = "return [...document.querySelectorAll(arguments[0])].map((one) => one.hash.split('/')[2] - 1)"
 # Values that come before smaller ones; texts as a dictionary has them, and numbers in them by their size.
@@ -37,33 +34,7 @@ DECODED = """
         .then(() => done(document.images.length), (error) => done(String(error)))"""
 
 
-def axe_script(work):
-    """The script of axe-core, and why there is none."""
-    script = work / "node_modules/axe-core/axe.min.js"
-    if not script.exists():
-        if not shutil.which("npm"):
-            return "", "there is no npm, which axe-core comes by"
-        work.mkdir(parents=True, exist_ok=True)
-        for name in ("package.json", "package-lock.json"):
-            shutil.copyfile(HERE / name, work / name)
-        done = subprocess.run(["npm", "ci", "--no-audit", "--no-fund"], cwd=work, capture_output=True, encoding="utf-8")
-        if done.returncode != 0:
-            return "", f"npm can't install axe-core: {done.stderr.strip()[-300:]}"
-    return script.read_text(encoding="utf-8"), ""
-
-
-class ReportInBrowser(unittest.TestCase):
-    @classmethod
-    def setUpClass(cls):
-        cls.page = browser.start()
-        cls.addClassCleanup(cls.page.quit)
-
-    def open(self, *arguments, **named):
-        self.page.open(self.report, *arguments, **named)
-
-    def names(self):
-        return self.page.texts(NAMES)
-
+class ReportInBrowser(ReportTest):
     def test_opens_without_a_complaint_and_asks_for_nothing(self):
         for view in VIEWS:
             self.open(view)
@@ -338,6 +309,30 @@ class ReportInBrowser(unittest.TestCase):
         self.page.click(".reset")
         self.assertEqual(len(self.names()), self.count)
 
+    def test_names_rates_by_their_size(self):
+        labels = ["24/1", "24000/1001", "30/1", "30000/1001", "5/1", "50/1"]
+
+        def change(whole):
+            whole["odd"] = [{"id": "rates", "title": "Mixed rates", "words": "w",
+                             "groups": [{"label": label, "clips": [0]} for label in labels]}]
+        self.page.open(pages.with_report(self.report, change, self.report.with_name("rates.html")), "#/odd")
+        told = [float(one.split("\u00a0")[0]) for one in self.page.texts(".finding .chip")]
+        self.assertEqual(told, [5, 23.976, 24, 29.97, 30, 50])
+
+    def test_shows_all_marks_of_a_clip(self):
+        warning = {"kind": "pictures", "reason": "r"}
+        for traits in (["noSound"], ["noSound", "noTimecode"], ["sampleProvider", "noSound", "rotated"]):
+            for warnings in ([], [warning]):
+                members = {"warnings": warnings, "traits": [{"id": one, "words": "w"} for one in traits]}
+                page = self.report.with_name("marks.html")
+                pages.with_clip(self.report, 0, members, page)
+                for width in (800, 1280, 1440, 3840):
+                    self.page.open(page, width=width)
+                    cut = self.page.run(
+                        "return [...document.querySelectorAll('.marks')].filter((one) => one.scrollHeight >"
+                        "one.clientHeight || one.scrollWidth > one.clientWidth).map((one) => one.textContent)")
+                    self.assertEqual(cut, [], (width, members))
+
     def test_keeps_few_rows_of_many_and_shows_each(self):
         self.page.open(self.many)
         self.assertLess(len(self.names()), 60)
@@ -377,19 +372,8 @@ class ReportInBrowser(unittest.TestCase):
         page.quit()
         self.assertFalse(folder.exists())
 
-    def test_is_accessible_by_axe(self):
-        if not self.axe:
-            self.skipTest(self.no_axe)
-        for width in (360, 1440):
-            for scheme in ("light", "dark"):
-                for view in VIEWS:
-                    self.open(view, width=width, scheme=scheme)
-                    self.page.run(self.axe)
-                    found = self.page.wait("const done = arguments[0]; axe.run().then((all) => done(all.violations))")
-                    self.assertEqual([(one["id"], one["nodes"][0]["html"]) for one in found], [], (width, scheme, view))
 
-
-def main(program, movies, work):
+def main(program, movies):
     reason = browser.why_none()
     if reason:
         print(f"skipped: {reason}")
@@ -397,13 +381,12 @@ def main(program, movies, work):
     with tempfile.TemporaryDirectory() as folder:
         folder = Path(folder)
         pages.make_movies(Path(movies), folder / "movies")
-        ReportInBrowser.report = pages.write(program, folder / "movies", folder / "report.html")
-        ReportInBrowser.split = pages.write(program, folder / "movies", folder / "a split #1 100%.html", "--split")
+        ReportTest.report = pages.write(program, folder / "movies", folder / "report.html")
+        ReportTest.split = pages.write(program, folder / "movies", folder / "a split #1 100%.html", "--split")
         pages.make_undrawn(Path(movies), folder / "undrawn")
-        ReportInBrowser.undrawn = pages.write(program, folder / "undrawn", folder / "undrawn.html")
-        ReportInBrowser.many = pages.multiply(ReportInBrowser.report, 1000, folder / "many.html")
-        ReportInBrowser.count = len(pages.document(ReportInBrowser.report.read_text(encoding="utf-8"))["clips"])
-        ReportInBrowser.axe, ReportInBrowser.no_axe = axe_script(Path(work))
+        ReportTest.undrawn = pages.write(program, folder / "undrawn", folder / "undrawn.html")
+        ReportTest.many = pages.multiply(ReportTest.report, 1000, folder / "many.html")
+        ReportTest.count = len(pages.document(ReportTest.report.read_text(encoding="utf-8"))["clips"])
         result = unittest.main(argv=sys.argv[:1], exit=False, verbosity=2).result
     return 0 if result.wasSuccessful() else 1
 

@@ -107,15 +107,22 @@ def with_details(page, number, members, to):
     return to
 
 
-def with_clip(page, number, members, to):
-    """The page, but for what the table shows of a clip; what is None is left out."""
+def with_report(page, change, to):
+    """The page, but for what a call changes of what it shows of all clips together."""
     text = page.read_text(encoding="utf-8")
     start, end = element(text, "report")
     whole = json.loads(text[start:end])
-    changed = dict(whole["clips"][number], **members)
-    whole["clips"][number] = {name: value for name, value in changed.items() if value is not None}
+    change(whole)
     to.write_text(text[:start] + in_script(whole) + text[end:], encoding="utf-8")
     return to
+
+
+def with_clip(page, number, members, to):
+    """The page, but for what the table shows of a clip; what is None is left out."""
+    def change(whole):
+        changed = dict(whole["clips"][number], **members)
+        whole["clips"][number] = {name: value for name, value in changed.items() if value is not None}
+    return with_report(page, change, to)
 
 
 def multiply(page, count, to):

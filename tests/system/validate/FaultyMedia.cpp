@@ -39,8 +39,15 @@ bool IsMovie(const fs::path& file) {
            std::memcmp(start.data() + 4, "ftyp", 4) == 0;
 }
 
-bool IsCalledMov(const fs::path& file) {
-    return file.extension() == ".mov";
+// Whether an entry of a folder has this ending.
+bool HasEntry(const fs::path& folder, const char* ending) {
+    std::error_code error;
+    for (const auto& entry : fs::directory_iterator(folder, error)) {
+        if (entry.path().extension() == ending) {
+            return true;
+        }
+    }
+    return false;
 }
 
 fs::path PathOf(INCFString* text) {
@@ -205,10 +212,9 @@ protected:
 
 class Container final : public Face<NMA::IMediaContainer3>, public ClipsFace, public Object {
 public:
-    static NCFRESULT Make(INCFUnknown* host, INCFUnknown* outer, Object** made) {
-        *made = new Container(host, outer);
-        return NCF_OK;
-    }
+    // One that claims files with this ending.
+    Container(INCFUnknown* host, INCFUnknown* outer, const char* ending, bool describes = true)
+        : Object(outer), host_(host), ending_(ending), describes_(describes) {}
 
     NCFRESULT IsContainerSupported() override {
         SufferFrom(path());
@@ -287,7 +293,7 @@ public:
         if (index >= 1) {
             return NCF_E_NOTFOUND;
         }
-        const NCFRESULT results[] = {GiveText(host_.get(), "MOV", extension),
+        const NCFRESULT results[] = {GiveText(host_.get(), ending_, extension),
                                      GiveText(host_.get(), "Movies", description),
                                      GiveText(host_.get(), "Media", group)};
         return *std::min_element(std::begin(results), std::end(results));
@@ -309,7 +315,6 @@ public:
     NCFRESULT GetClipPath(ncfSInt32, INCFString*) override { return NCF_E_NOTIMPL; }
 
 private:
-    Container(INCFUnknown* host, INCFUnknown* outer) : Object(outer), host_(host) {}
     ~Container() override {
         if (mapping_) {
             mapping_->LoseContainer();
@@ -383,7 +388,7 @@ private:
             IsWronglyRefused();
             return NCF_E_FAIL;
         }
-        if (IsWronglyRefused() || Is("container-describes")) {
+        if (IsWronglyRefused() || !describes_ || Is("container-describes")) {
             return NCF_E_FAIL;
         }
         void* factory = nullptr;
@@ -413,6 +418,8 @@ private:
     }
 
     host::Ref<INCFUnknown> host_;
+    const char* ending_;
+    bool describes_;
     host::Ref<INCFString> kept_;
     host::Ref<Mapping> mapping_;
     fs::path path_;
@@ -423,10 +430,10 @@ private:
 // The movies of a folder.
 class FolderClips final : public Face<NMA::IAAFClips>, public Object {
 public:
-    explicit FolderClips(const fs::path& folder) : Object(nullptr) {
+    FolderClips(const fs::path& folder, const char* ending) : Object(nullptr) {
         std::error_code error;
         for (const auto& entry : fs::directory_iterator(folder, error)) {
-            if (IsCalledMov(entry.path())) {
+            if (entry.path().extension() == ending) {
                 files_.push_back(entry.path());
             }
         }
@@ -480,7 +487,8 @@ host::Ref<FolderClips> volumesClips;
 
 class Format final : public Face<NMA::IMediaFormat>, public Object {
 public:
-    explicit Format(fs::path folder) : Object(nullptr), folder_(std::move(folder)) {}
+    Format(fs::path folder, const char* ending)
+        : Object(nullptr), folder_(std::move(folder)), ending_(ending) {}
 
     ncfBool FormatFlagA() override { return 1; }
     ncfBool FormatFlagB() override { return 0; }
@@ -492,7 +500,7 @@ public:
         if (clips == nullptr) {
             return NCF_E_INVALIDARG;
         }
-        auto* const made = new FolderClips(folder_);
+        auto* const made = new FolderClips(folder_, ending_);
         if (Is("volume-format")) {
             made->Forget();
         }
@@ -510,6 +518,7 @@ private:
     }
 
     fs::path folder_;
+    const char* ending_;
 };
 
 class VolumeInfo final : public Face<NMA::IVolumeInfo>, public Object {
@@ -556,23 +565,16 @@ private:
 
 class Volume final : public Face<NMA::IMediaVolume>, public Object {
 public:
-    static NCFRESULT Make(INCFUnknown* host, INCFUnknown* outer, Object** made) {
-        *made = new Volume(host, outer);
-        return NCF_OK;
-    }
+    // One that claims folders of files with one ending, and lists those with another.
+    Volume(INCFUnknown* host, INCFUnknown* outer, const char* claimed, const char* listed)
+        : Object(outer), host_(host), claimed_(claimed), listed_(listed) {}
 
     NCFRESULT IsMediaVolume(INCFString* path) override {
         if (path == nullptr || Is("volume-claims") || (Is("volume-claims-again") && wasAsked_)) {
             return 0;
         }
         wasAsked_ = true;
-        std::error_code error;
-        for (const auto& entry : fs::directory_iterator(PathOf(path), error)) {
-            if (IsCalledMov(entry.path())) {
-                return 1;
-            }
-        }
-        return Is("volume-other-folders") ? 1 : 0;
+        return HasEntry(PathOf(path), claimed_) || Is("volume-other-folders") ? 1 : 0;
     }
     NCFRESULT GetVolumeInfo(INCFString* path, NMA::IVolumeInfo** info) override {
         if (path == nullptr || info == nullptr) {
@@ -588,7 +590,7 @@ public:
         if (path == nullptr || format == nullptr) {
             return NCF_E_INVALIDARG;
         }
-        *format = new Format(PathOf(path));
+        *format = new Format(PathOf(path), listed_);
         return NCF_OK;
     }
     NCFRESULT GetContainerComponentId(GUID* id) override {
@@ -600,7 +602,6 @@ public:
     }
 
 private:
-    Volume(INCFUnknown* host, INCFUnknown* outer) : Object(outer), host_(host) {}
     ~Volume() override {
         if (volumesClips) {
             volumesClips->Forget();
@@ -613,17 +614,41 @@ private:
     }
 
     host::Ref<INCFUnknown> host_;
+    const char* claimed_;
+    const char* listed_;
     bool wasAsked_ = false;
 };
 
 }  // namespace
 
 NCFRESULT MakeVolume(INCFUnknown* host, INCFUnknown* outer, Object** made) {
-    return Volume::Make(host, outer, made);
+    *made = new Volume(host, outer, ".mov", ".mov");
+    return NCF_OK;
 }
 
 NCFRESULT MakeContainer(INCFUnknown* host, INCFUnknown* outer, Object** made) {
-    return Container::Make(host, outer, made);
+    *made = new Container(host, outer, "MOV");
+    return NCF_OK;
+}
+
+NCFRESULT MakeTextVolume(INCFUnknown* host, INCFUnknown* outer, Object** made) {
+    *made = new Volume(host, outer, ".txt", ".txt");
+    return NCF_OK;
+}
+
+NCFRESULT MakeTextContainer(INCFUnknown* host, INCFUnknown* outer, Object** made) {
+    *made = new Container(host, outer, "TXT");
+    return NCF_OK;
+}
+
+NCFRESULT MakeLastVolume(INCFUnknown* host, INCFUnknown* outer, Object** made) {
+    *made = new Volume(host, outer, Is("last-volume") ? ".mov" : ".txt", ".txt");
+    return NCF_OK;
+}
+
+NCFRESULT MakeLastContainer(INCFUnknown* host, INCFUnknown* outer, Object** made) {
+    *made = new Container(host, outer, Is("last-container") ? "MOV" : "TXT", false);
+    return NCF_OK;
 }
 
 }  // namespace faulty

@@ -108,6 +108,14 @@ constexpr GUID kThingComponent = ncfGuid("22222222-0000-4000-8000-000000000006")
 constexpr GUID kThingClass = ncfGuid("22222222-0000-4000-8000-000000000016");
 constexpr GUID kVolumeComponent = ncfGuid("22222222-0000-4000-8000-000000000007");
 constexpr GUID kVolumeClass = ncfGuid("22222222-0000-4000-8000-000000000017");
+constexpr GUID kTextVolumeComponent = ncfGuid("22222222-0000-4000-8000-000000000020");
+constexpr GUID kTextVolumeClass = ncfGuid("22222222-0000-4000-8000-000000000030");
+constexpr GUID kTextContainerComponent = ncfGuid("22222222-0000-4000-8000-000000000021");
+constexpr GUID kTextContainerClass = ncfGuid("22222222-0000-4000-8000-000000000031");
+constexpr GUID kLastVolumeComponent = ncfGuid("22222222-0000-4000-8000-000000000022");
+constexpr GUID kLastVolumeClass = ncfGuid("22222222-0000-4000-8000-000000000032");
+constexpr GUID kLastContainerComponent = ncfGuid("22222222-0000-4000-8000-000000000023");
+constexpr GUID kLastContainerClass = ncfGuid("22222222-0000-4000-8000-000000000033");
 constexpr GUID kShyComponent = ncfGuid("22222222-0000-4000-8000-000000000008");
 constexpr GUID kShyClass = ncfGuid("22222222-0000-4000-8000-000000000018");
 
@@ -186,7 +194,7 @@ public:
 
 private:
     explicit Thing(INCFUnknown* outer) : Object(outer) {
-        if (++TheState().liveThings > 20 && Is("fuzz-calls")) {
+        if (++TheState().liveThings > 8 && Is("fuzz-calls")) {
             Crash();
         }
     }
@@ -275,11 +283,16 @@ struct Row {
     Maker maker;
 };
 
-constexpr Row kRows[] = {{kThingComponent, kThingClass, "Thing", Thing::Make},
-                         {kVolumeComponent, kVolumeClass, "Volume", MakeVolume},
-                         {kContainerComponent, kContainerClass, "Container", MakeContainer},
-                         {kShyComponent, kShyClass, "Shy", nullptr}};
-constexpr ncfUInt32 kCount = 4;
+constexpr Row kRows[] = {
+    {kThingComponent, kThingClass, "Thing", Thing::Make},
+    {kTextVolumeComponent, kTextVolumeClass, "Text volume", MakeTextVolume},
+    {kTextContainerComponent, kTextContainerClass, "Text container", MakeTextContainer},
+    {kVolumeComponent, kVolumeClass, "Volume", MakeVolume},
+    {kContainerComponent, kContainerClass, "Container", MakeContainer},
+    {kLastVolumeComponent, kLastVolumeClass, "Last volume", MakeLastVolume},
+    {kLastContainerComponent, kLastContainerClass, "Last container", MakeLastContainer},
+    {kShyComponent, kShyClass, "Shy", nullptr}};
+constexpr ncfUInt32 kCount = std::size(kRows);
 
 // A definition object of the module's own.
 class OwnDefinition final : public INCFPluginDefinition {

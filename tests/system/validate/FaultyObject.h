@@ -115,9 +115,14 @@ Interface* Service(INCFUnknown* host, const GUID& component) {
     return static_cast<Interface*>(made);
 }
 
-// The media components.
+// The media components: for movies; for texts; and for texts, but when they are to be wrong, the
+// container claims movies and describes none, the volume claims their folder and lists none.
 NCFRESULT MakeVolume(INCFUnknown* host, INCFUnknown* outer, Object** made);
 NCFRESULT MakeContainer(INCFUnknown* host, INCFUnknown* outer, Object** made);
+NCFRESULT MakeTextVolume(INCFUnknown* host, INCFUnknown* outer, Object** made);
+NCFRESULT MakeTextContainer(INCFUnknown* host, INCFUnknown* outer, Object** made);
+NCFRESULT MakeLastVolume(INCFUnknown* host, INCFUnknown* outer, Object** made);
+NCFRESULT MakeLastContainer(INCFUnknown* host, INCFUnknown* outer, Object** made);
 
 inline constexpr GUID kContainerComponent = ncfGuid("22222222-0000-4000-8000-000000000003");
 inline constexpr GUID kContainerClass = ncfGuid("22222222-0000-4000-8000-000000000013");

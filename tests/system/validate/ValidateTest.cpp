@@ -4,10 +4,13 @@
 // `cliphost validate`: it finds each thing that a module can be wrong in, and nothing in modules
 // that are right.
 
+#include <algorithm>
 #include <cstdlib>
 #include <fstream>
+#include <iterator>
 #include <nlohmann/json.hpp>
 #include <set>
+#include <sstream>
 
 #include "reference_host/validate/Check.h"
 #include "tests/system/Command.h"
@@ -204,6 +207,100 @@ constexpr Row kRows[] = {
     {"fuzz-movies", "crashed"},
 };
 
+// Faults that other checks find, too, since they look at the same thing from another side or rely
+// on it.
+struct Also {
+    const char* id;
+    const char* others;
+};
+constexpr Also kAlso[] = {
+    {"order-unload-question-first",
+     "order-creation-not-started order-start-twice "
+     "order-shutdown-with-objects"},
+    {"order-shutdown-twice", "shutdown-succeeds"},
+    {"order-start-again", "order-shutdown-without-start refusal-start"},
+    {"order-shutdown-with-objects", "order-factory-not-started"},
+    {"order-other-thread", "order-creation-on-threads"},
+    {"order-creation-on-threads", "order-other-thread"},
+    {"plugin-component-count", "component-index-beyond"},
+    {"component-definitions",
+     "order-registration-after-start definition-once "
+     "refusal-component-registration"},
+    {"component-ids", "create-by-component-id volume-container-id"},
+    {"definition-once", "refusal-definition-calls"},
+    {"registration-twice", "order-plugin-registration-on-two-threads"},
+    {"registration-keeps-nothing", "shutdown-gives-back"},
+    {"refusal-creation", "refusal-query"},
+    {"refusal-query", "refusal-creation"},
+    {"factory-offered", "order-start-without-registration"},
+    {"factory-unknown-interface", "fuzz-calls"},
+    {"factory-interfaces", "query-unknown-interface"},
+    {"factory-kept",
+     "order-other-thread create-unknown-interface objects-many "
+     "unload-refused-goes-on"},
+    {"factory-refuses-unloading", "factory-counted-each"},
+    {"factory-counted-each",
+     "create-by-component-id counts-end unload-refused mapping-outlives "
+     "fuzz-calls"},
+    {"factory-released-first",
+     "order-start-without-registration order-creation-on-threads "
+     "factory-offered factory-counted-each create-by-component-id "
+     "leaks-objects"},
+    {"create-unknown-interface",
+     "container-leaves-nothing files-broken files-hostile files-huge "
+     "leaks-refused-creation fuzz-calls fuzz-movies"},
+    {"create-by-class-id", "create-by-component-id"},
+    {"create-by-component-id", "order-creation-on-threads volume-container-id leaks-objects"},
+    {"query-root", "create-aggregated-interfaces"},
+    {"query-unknown-interface", "factory-interfaces"},
+    {"query-reflexive", "query-transitive"},
+    {"query-symmetric", "query-transitive"},
+    {"query-transitive", "query-symmetric"},
+    {"query-stable", "query-symmetric"},
+    {"counts-on-threads", "order-other-thread order-creation-on-threads"},
+    {"objects-locks", "container-locks"},
+    {"unload-refused",
+     "order-unload-question-on-two-threads factory-refuses-unloading "
+     "factory-counted-each create-aggregated-root mapping-outlives "
+     "fuzz-calls"},
+    {"shutdown-succeeds",
+     "order-shutdown-without-start order-shutdown-twice order-start-again "
+     "refusal-start"},
+    {"shutdown-gives-back", "refusal-start"},
+    {"unload-and-load-again", "order-start-twice order-start-again refusal-start"},
+    {"volume-claims-again", "volume-creations-refused volume-queries-refused"},
+    {"volume-other-folders", "volume-format volume-released-first"},
+    {"volume-format", "volume-released-first"},
+    {"volume-clip-descriptions", "volume-bad-files"},
+    {"volume-creations-refused", "volume-queries-refused"},
+    {"volume-queries-refused", "volume-creations-refused"},
+    {"container-missing-file", "container-without-path"},
+    {"container-closes-file", "leaks-descriptions"},
+    {"container-leaves-nothing",
+     "files-broken files-hostile files-huge leaks-descriptions fuzz-movies"},
+    {"container-creations-refused", "container-queries-refused"},
+    {"description-is-aaf",
+     "description-master-mob description-ids description-ids-stable "
+     "description-ids-differ description-slots description-outlives"},
+    {"mapping-tracks",
+     "mapping-samples mapping-in-file mapping-other-tracks "
+     "mapping-other-samples mapping-null-outputs"},
+    {"mapping-creations-refused", "mapping-queries-refused"},
+    {"mapping-queries-refused", "mapping-creations-refused"},
+    {"files-broken",
+     "container-without-path container-locks container-missing-file "
+     "files-good-after-bad files-that-change"},
+    {"leaks-objects", "leaks-refused-creation"},
+    {"fuzz-calls", "objects-many"},
+    {"fuzz-movies",
+     "container-locks files-broken files-hostile files-good-after-bad "
+     "leaks-broken-files"},
+};
+
+// Faults with which next to nothing works, and one whose thread may crash any check.
+constexpr const char* kWide[] = {"file-loads-again", "plugin-definition",    "counts-end",
+                                 "unload-allowed",   "container-file-types", "order-no-thread"};
+
 void PrintTo(const Row& row, std::ostream* out) {
     *out << row.id;
 }
@@ -242,12 +339,92 @@ TEST_P(ValidatesWrongModule, AndFindsTheFault) {
               std::string::npos);
 }
 
-INSTANTIATE_TEST_SUITE_P(OfEachKind, ValidatesWrongModule, testing::ValuesIn(kRows),
-                         [](const auto& test) {
-                             std::string name = test.param.id;
-                             std::replace(name.begin(), name.end(), '-', '_');
-                             return name;
-                         });
+std::string NameOfRow(const testing::TestParamInfo<Row>& test) {
+    std::string name = test.param.id;
+    std::replace(name.begin(), name.end(), '-', '_');
+    return name;
+}
+
+INSTANTIATE_TEST_SUITE_P(OfEachKind, ValidatesWrongModule, testing::ValuesIn(kRows), NameOfRow);
+
+std::vector<Row> NarrowRows() {
+    std::vector<Row> rows;
+    std::copy_if(std::begin(kRows), std::end(kRows), std::back_inserter(rows), [](const Row& row) {
+        return std::none_of(std::begin(kWide), std::end(kWide),
+                            [&](const char* id) { return std::string_view(row.id) == id; });
+    });
+    return rows;
+}
+
+// "container-": what checks of one group are called.
+std::string GroupOf(const std::string& id) {
+    return id.substr(0, id.find('-') + 1);
+}
+
+std::set<std::string> OthersThatFind(const std::string& fault) {
+    for (const Also& also : kAlso) {
+        if (also.id == fault) {
+            std::istringstream words(also.others);
+            return {std::istream_iterator<std::string>(words), {}};
+        }
+    }
+    return {};
+}
+
+class ValidatesOneFault : public ValidatesWrongModule {
+protected:
+    // Holds a wrong module against all other checks whose names begin so: those of the table find
+    // its fault, too, and no others find anything.
+    void ExpectOthers(const std::string& beginning) {
+        const Row row = GetParam();
+        setenv("CLIPHOST_FAULT", row.id, 1);
+        const auto module = std::string(row.module) == "text" ? Text() : Faulty(row.module);
+        std::string options = "--limit-seconds 100000";  // however slow the machine is
+        std::set<std::string> expected;
+        const std::set<std::string> others = OthersThatFind(row.id);
+        for (const Row& other : kRows) {
+            const std::string id = other.id;
+            if (id != row.id && id.rfind(beginning, 0) == 0) {
+                options += " --only " + id;
+                if (others.count(id) != 0) {
+                    expected.insert(id);
+                }
+            }
+        }
+        const Answer answer = Validate(module, options);
+        std::set<std::string> found;
+        for (const json& check : answer.value["checks"]) {
+            if (check["verdict"] != "passed" && check["verdict"] != "skipped") {
+                found.insert(check["id"]);
+            }
+        }
+        EXPECT_EQ(found, expected);
+    }
+};
+
+TEST_P(ValidatesOneFault, AndNoOtherCheckOfItsGroupFindsOneButThoseOfTheTable) {
+    ExpectOthers(GroupOf(GetParam().id));
+}
+
+INSTANTIATE_TEST_SUITE_P(OfEachKind, ValidatesOneFault, testing::ValuesIn(NarrowRows()), NameOfRow);
+
+class ValidatesAllOfOneFault : public ValidatesOneFault {};
+
+TEST_P(ValidatesAllOfOneFault, AndNoOtherCheckFindsOneButThoseOfTheTable) {
+    ExpectOthers("");
+}
+
+INSTANTIATE_TEST_SUITE_P(Thorough, ValidatesAllOfOneFault, testing::ValuesIn(NarrowRows()),
+                         NameOfRow);
+
+TEST_F(Validates, TheTableOfOthersNamesChecks) {
+    for (const Also& also : kAlso) {
+        EXPECT_NE(validate::FindCheck(also.id), nullptr) << also.id;
+        for (const std::string& other : OthersThatFind(also.id)) {
+            EXPECT_NE(validate::FindCheck(other.c_str()), nullptr) << other;
+        }
+    }
+}
 
 TEST_F(Validates, EachCheckHasAModuleThatIsWrongInIt) {
     std::set<std::string> checks;
@@ -431,6 +608,39 @@ TEST_F(Validates, EachComponentOfTheModule) {
                            .Of("refusal-definition-calls");
     EXPECT_EQ(check["verdict"], "failed");
     EXPECT_NE(check.value("done", "").find("component 1 "), std::string::npos) << check.dump(2);
+}
+
+TEST_F(Validates, EachContainerAndEachVolumeThatClaimsMovies) {
+    struct Wrong {
+        const char* fault;
+        const char* id;
+        const char* done;
+    };
+    for (const Wrong& wrong :
+         {Wrong{"last-container", "container-describes",
+                "component 6, Last container: describing a sound movie"},
+          Wrong{"last-volume", "volume-format",
+                "component 5, Last volume: listing the clips of a folder of movies"}}) {
+        SCOPED_TRACE(wrong.fault);
+        setenv("CLIPHOST_FAULT", wrong.fault, 1);
+        const Answer answer = Validate(Faulty("FaultyModule"), std::string("--only ") + wrong.id);
+        EXPECT_EQ(answer.status, 1);
+        const json check = answer.Of(wrong.id);
+        EXPECT_EQ(check["verdict"], "failed");
+        EXPECT_EQ(check.value("done", "").rfind(wrong.done, 0), 0u) << check.dump(2);
+    }
+}
+
+TEST_F(Validates, AContainerWhereAnotherOneSkipsTheCheck) {
+    setenv("CLIPHOST_FAULT", "last-container", 1);  // it describes nothing, so it skips that
+    const Answer answer = Validate(Faulty("FaultyModule"), "--only description-slots");
+    EXPECT_EQ(answer.Of("description-slots")["verdict"], "passed");
+    setenv("CLIPHOST_FAULT", "container-describes", 1);  // no other one claims movies
+    const json skipped =
+        Validate(Faulty("FaultyModule"), "--only description-slots").Of("description-slots");
+    EXPECT_EQ(skipped["verdict"], "skipped");
+    EXPECT_EQ(skipped.value("found", "").rfind("the module does not describe a sound movie", 0),
+              0u);
 }
 
 TEST_F(Validates, AndWarnsWhereCallsHaveNoEnd) {

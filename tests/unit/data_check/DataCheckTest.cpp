@@ -131,7 +131,8 @@ TEST_F(DataChecks, FindValuesThatAnAafLibraryRefuses) {
                                                           {"ColorRange", "4294967296"},
                                                           {"ColorRange", "99999999999999999999"},
                                                           {"ColorRange", "+897"},
-                                                          {"ColorRange", "0897"},
+                                                          {"ColorRange", "00"},
+                                                          {"ColorRange", "0x381"},
                                                           {"BlackRefLevel", "-1"}}) {
         EXPECT_THAT(Check(Record(With(name, value))),
                     Contains(HasSubstr("rp210:" + name + " can't be \"" + value + "\"; give ")));
@@ -397,7 +398,8 @@ TEST_F(DataChecks, FindEntriesWithoutKeyOrDescriptor) {
                       Contains(HasSubstr("the record has no descriptor"))));
     EXPECT_THAT(Check("<MediaDescriptorSignature/>"),
                 Contains(HasSubstr("MediaDescriptorSignature lacks NivoInfo")));
-    EXPECT_THAT(Check(Record(Good(), "010000")), Contains(HasSubstr("ResolutionID can't be")));
+    EXPECT_THAT(Check(Record(Good(), "010000")),
+                Contains(HasSubstr("ResolutionID has zeros before its number")));
     EXPECT_THAT(Check(Record(Good()), "<FourCharMapping vcid='1'/>"),
                 Contains(HasSubstr("FourCharMapping lacks FourChar")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc", "vcid='1'")),
@@ -576,6 +578,53 @@ TEST_F(DataChecks, TellNothingThatFollowsFromAnotherMistake) {
                 ElementsAre(HasSubstr("rp210:StoredWidth can't be \"x\"")));
     EXPECT_THAT(Check(Record(Good()), Row("dvc", "vcid='10000'")),
                 ElementsAre(HasSubstr("FourChar must have four characters")));
+}
+
+TEST_F(DataChecks, TellAMistypedNameAloneAndNotThatTheRightOneLacks) {
+    Values values = Good();
+    values.erase("rp210:WhiteReflevel");
+    values["rp210:WhiteRefLevel"] = "940";
+    EXPECT_THAT(Check(Record(values)),
+                ElementsAre(HasSubstr("rp210:WhiteRefLevel means nothing here; write "
+                                      "rp210:WhiteReflevel")));
+    values = Good();
+    values.erase("rp210:StoredWidth");
+    values["rp210:StoredWith"] = "720";
+    EXPECT_THAT(Check(Record(values)), ElementsAre(HasSubstr("rp210:StoredWith means nothing")));
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI", "<rp210:VideoLinesMap/>")),
+                ElementsAre(HasSubstr("rp210:VideoLinesMap means nothing here; write "
+                                      "rp210:VideoLineMap")));
+    EXPECT_THAT(Check(Record(Good()), "<FourCharMapping FourChr='dvc ' vcid='10000'/>"),
+                ElementsAre(HasSubstr("FourChr means nothing here; write FourChar")));
+}
+
+// The other one is still to be told.
+TEST_F(DataChecks, TellALackBesideANameThatIsLikeAnother) {
+    Values values = Good();
+    values.erase("rp210:StoredWidth");
+    values["rp210:StoredHeigth"] = "1";
+    EXPECT_THAT(Check(Record(values)),
+                AllOf(Contains(HasSubstr("rp210:StoredHeigth means nothing here")),
+                      Contains(HasSubstr("lacks rp210:StoredWidth"))));
+}
+
+TEST_F(DataChecks, TellAnUnknownElementAloneWhereItHoldsWhatARecordNeeds) {
+    EXPECT_THAT(Check(Record(Good(), "10000", "CDCI",
+                             "<Lines><rp210:VideoLineMap><rp210:Element>23</rp210:Element>"
+                             "</rp210:VideoLineMap></Lines>")),
+                ElementsAre(HasSubstr("Lines means nothing here; take it out")));
+}
+
+// The module finds ids by their letters, and reads other numbers without the zeros.
+TEST_F(DataChecks, TellZerosBeforeANumberAsThat) {
+    EXPECT_THAT(Check(Record(With("ColorRange", "0897"))),
+                ElementsAre(HasSubstr(
+                    "rp210:ColorRange has zeros before its number: \"0897\"; write 897")));
+    EXPECT_THAT(Check(Record(Good(), "010000")),
+                ElementsAre(HasSubstr("ResolutionID has zeros before its number: \"010000\"; "
+                                      "write 10000")));
+    EXPECT_THAT(Check(Record(With("BlackRefLevel", "00"))),
+                ElementsAre(HasSubstr("rp210:BlackRefLevel has zeros before its number")));
 }
 
 // A name that the module passes over leaves the rest of its row as it is.
