@@ -5,6 +5,7 @@
 #include <fcntl.h>
 #include <io.h>
 
+#include <atomic>
 #include <cstdio>
 #include <cstdlib>
 
@@ -22,15 +23,24 @@ bool IsConsole(DWORD stream) {
     return GetConsoleMode(GetStdHandle(stream), &mode) != 0;
 }
 
+std::atomic<UINT> codePageBefore = 0;  // 0: it is as it was
+
 // The console is the caller's, who may go on with another program.
 void PrintUtf8() {
-    static const UINT before = GetConsoleOutputCP();
+    const UINT before = GetConsoleOutputCP();
     if (before != 0 && before != CP_UTF8 && SetConsoleOutputCP(CP_UTF8)) {
-        std::atexit([] { SetConsoleOutputCP(before); });
+        codePageBefore = before;
+        std::atexit(PutConsoleBack);
     }
 }
 
 }  // namespace
+
+void PutConsoleBack() {
+    if (const UINT before = codePageBefore.exchange(0)) {
+        SetConsoleOutputCP(before);
+    }
+}
 
 void PrepareProcess() {
     // Nobody may sit there to close a window.
@@ -58,6 +68,8 @@ std::vector<std::string> CommandLineWords(int argc, char** argv) {
     LocalFree(parted);
     return words;
 }
+
+const char* const kSettingsFolderInWords = "%APPDATA%\\";
 
 std::filesystem::path SettingsFolder() {
     const wchar_t* const folder = _wgetenv(L"APPDATA");

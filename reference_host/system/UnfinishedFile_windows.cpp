@@ -86,6 +86,7 @@ extern "C" void EndBySignal(int signal) {
             DeleteFileW(name.second.c_str());
         }
     }
+    PutConsoleBack();
     TerminateProcess(GetCurrentProcess(), signal == SIGINT
                                               ? static_cast<UINT>(STATUS_CONTROL_C_EXIT)
                                               : 128u + static_cast<UINT>(signal));

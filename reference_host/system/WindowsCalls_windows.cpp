@@ -2,21 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/WindowsCalls.h"
 
-#include <cerrno>
-#include <system_error>
-
 #include "text/Encodings.h"
 
 namespace host::system {
-
-int ErrorNumber(DWORD error) {
-    if (error == ERROR_NO_DATA || error == ERROR_BROKEN_PIPE) {
-        return EPIPE;
-    }
-    const std::error_condition plain =
-        std::system_category().default_error_condition(static_cast<int>(error));
-    return plain.category() == std::generic_category() ? plain.value() : EIO;
-}
 
 std::string ErrorWords(DWORD error) {
     wchar_t words[1024];
