@@ -50,7 +50,7 @@ std::filesystem::path BehindLinks(const std::filesystem::path& path) {
 }
 
 // The place's own name shows whose part it is. One that leaves no room for more is told by a
-// number; a writer may put a few letters behind this name again.
+// number; a writer may put its ending behind this name again.
 std::filesystem::path NameBeside(const std::filesystem::path& place) {
     constexpr std::size_t kLongestName = 255;
     constexpr std::size_t kRoom = 32;
@@ -84,6 +84,8 @@ extern "C" void EndBySignal(int signal) {
         const std::lock_guard<std::mutex> held(lock);
         for (const auto& name : names) {
             DeleteFileW(name.second.c_str());
+            DeleteFileW(
+                (std::filesystem::path(name.second) += UnfinishedFile::kWriterEnding).c_str());
         }
     }
     PutConsoleBack();
