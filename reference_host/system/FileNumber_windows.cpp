@@ -16,7 +16,8 @@ std::uint64_t NumberOfName(HANDLE opened, const std::filesystem::path& file) {
     const std::wstring whole = TextOf([&](wchar_t* text, DWORD size) {
         return GetFinalPathNameByHandleW(opened, text, size, FILE_NAME_NORMALIZED);
     });
-    return std::hash<std::wstring>()(NameKey(whole.empty() ? AbsolutePath(file) : whole).native());
+    return std::hash<std::wstring>()(
+        NameKey(whole.empty() ? AbsolutePath(file).native() : whole).native());
 }
 
 }  // namespace

@@ -43,6 +43,7 @@ void PutConsoleBack() {
 }
 
 void PrepareProcess() {
+    EndByEvents();
     // Nobody may sit there to close a window.
     SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOGPFAULTERRORBOX | SEM_NOOPENFILEERRORBOX);
     for (const int stream : {0, 1, 2}) {

@@ -24,9 +24,6 @@ BOOL WINAPI EndByEvent(DWORD event) {
     return TRUE;
 }
 
-// Before all others: who comes later is asked first, such as who only notes that the run is to end.
-[[maybe_unused]] const BOOL isAsked = SetConsoleCtrlHandler(EndByEvent, TRUE);
-
 int Keep(const std::filesystem::path& file) {
     const std::lock_guard<std::mutex> held(lock);
     names[nextNumber] = AbsolutePath(file).native();
@@ -78,6 +75,10 @@ bool Move(const std::filesystem::path& from, const std::filesystem::path& to, DW
 }
 
 }  // namespace
+
+void EndByEvents() {
+    SetConsoleCtrlHandler(EndByEvent, TRUE);
+}
 
 extern "C" void EndBySignal(int signal) {
     {

@@ -52,6 +52,10 @@ OwnedHandle OpenThere(const std::filesystem::path& path, DWORD access);
 // has an event.
 void EndCall(HANDLE file, OVERLAPPED& call);
 
+// Lets Ctrl+C and the like end the program as a signal does, unless somebody takes them who asks
+// for them later. To be called by the program, not by a library that has a copy of all this.
+void EndByEvents();
+
 // Gives the console back as it was found.
 void PutConsoleBack();
 
