@@ -5,7 +5,6 @@
 #include <fcntl.h>
 #include <io.h>
 
-#include <atomic>
 #include <cstdio>
 #include <cstdlib>
 
@@ -23,24 +22,7 @@ bool IsConsole(DWORD stream) {
     return GetConsoleMode(GetStdHandle(stream), &mode) != 0;
 }
 
-std::atomic<UINT> codePageBefore = 0;  // 0: it is as it was
-
-// The console is the caller's, who may go on with another program.
-void PrintUtf8() {
-    const UINT before = GetConsoleOutputCP();
-    if (before != 0 && before != CP_UTF8 && SetConsoleOutputCP(CP_UTF8)) {
-        codePageBefore = before;
-        std::atexit(PutConsoleBack);
-    }
-}
-
 }  // namespace
-
-void PutConsoleBack() {
-    if (const UINT before = codePageBefore.exchange(0)) {
-        SetConsoleOutputCP(before);
-    }
-}
 
 void PrepareProcess() {
     EndByEvents();

@@ -56,7 +56,9 @@ void EndCall(HANDLE file, OVERLAPPED& call);
 // for them later. To be called by the program, not by a library that has a copy of all this.
 void EndByEvents();
 
-// Gives the console back as it was found.
+// Has the console take UTF-8. It is the caller's, who may go on with another program, so it is put
+// back at the end.
+void PrintUtf8();
 void PutConsoleBack();
 
 // Set from when a signal has come until it is waited for anew.

@@ -2,9 +2,17 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/WindowsCalls.h"
 
+#include <atomic>
+#include <cstdlib>
+
 #include "text/Encodings.h"
 
 namespace host::system {
+namespace {
+
+std::atomic<UINT> codePageBefore = 0;  // 0: it is as it was
+
+}  // namespace
 
 std::string ErrorWords(DWORD error) {
     wchar_t words[1024];
@@ -29,6 +37,20 @@ void EndCall(HANDLE file, OVERLAPPED& call) {
     // The event may be other calls', too, so it doesn't tell that this one has ended.
     while (!HasOverlappedIoCompleted(&call)) {
         WaitForSingleObject(call.hEvent, 1);
+    }
+}
+
+void PrintUtf8() {
+    const UINT before = GetConsoleOutputCP();
+    if (before != 0 && before != CP_UTF8 && SetConsoleOutputCP(CP_UTF8)) {
+        codePageBefore = before;
+        std::atexit(PutConsoleBack);
+    }
+}
+
+void PutConsoleBack() {
+    if (const UINT before = codePageBefore.exchange(0)) {
+        SetConsoleOutputCP(before);
     }
 }
 
