@@ -1,8 +1,8 @@
 #!/usr/bin/env bash
 # Builds for 64-bit Windows what the program links, out of the sources of Debian's packages, and prints the
 # folder where it lies. A machine does that once: the folder's name tells the recipe, the compiler, and the
-# versions that Linux has. Of apt it has lists of its own, so the machine's stay as they are. Exit status: 3, the
-# sources can't be fetched; 1, anything else.
+# versions that Linux has. Of apt it has lists of its own, so the machine's stay as they are. Exit status: 3, no
+# list of packages can be fetched, as without a network; 1, anything else.
 set -Eeuo pipefail
 
 release=bookworm
@@ -110,6 +110,11 @@ fetch() { # apt's own lists, keys and cache, and what they name
                  -o Dir::Etc::preferencesparts=- -o APT::Sandbox::User= -o Acquire::Retries=3)
   cd "$work/source"
   apt-get "${options[@]}" update >log 2>&1 || true # what lacks then is told below
+  if ! compgen -G "$work/apt/lists/*Sources*" >/dev/null; then
+    tail -n 20 log >&2
+    printf 'windows_libraries: no list of packages can be fetched from http://deb.debian.org\n' >&2
+    exit 3
+  fi
   local source
   for source in dav1d "${sources[@]}"; do # the release's own, where a mirror has no security updates
     apt-get "${options[@]}" --only-source source "$source" >>log 2>&1 \
@@ -117,7 +122,7 @@ fetch() { # apt's own lists, keys and cache, and what they name
       || { tail -n 20 log >&2
            printf 'windows_libraries: Debian %s has no source package %s at http://deb.debian.org that can be fetched\n' \
              $release "$source" >&2
-           exit 3; }
+           exit 1; }
   done
 }
 

@@ -27,11 +27,13 @@ $difference"
 imports() { $objdump -p "$1" | sed -n 's/.*DLL Name: //p' | sort -u; }
 exports() { $objdump -p "$1" | sed -n '/^\[Ordinal\/Name Pointer\]/,/^$/s/^\t\[ *[0-9]*\] //p' | sort; }
 while IFS=: read -r file allowed; do
+  [ -n "$(imports "$file")" ] || fail "$file: no imports can be read"
   more=$(comm -13 <(tr ' ' '\n' <<<"$allowed" | sort) <(imports "$file"))
   [ -z "$more" ] || fail "$file imports what its list lacks:" $more
 done < <(grep '^[^#].*: ' "$contents")
 
 wanted=$(sed -n 's/^ *\(NCF[A-Za-z]*\);$/\1/p' "${contents%/cmake/*}/source/plugin/entry/exports.map" | sort)
+[ -n "$wanted" ] || fail "no function can be read out of exports.map"
 [ "$(exports plugins/QuickTimePlugin.nvx)" = "$wanted" ] \
   || fail "the module exports" $(exports plugins/QuickTimePlugin.nvx)
 

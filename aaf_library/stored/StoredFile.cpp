@@ -6,6 +6,7 @@
 #include "aaf_library/stored/StoredError.h"
 #include "aaf_library/stored/TreeReader.h"
 #include "aaf_library/stored/TreeWriter.h"
+#include "aaf_library/stored/WritePieces.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -57,15 +58,8 @@ public:
     }
 
     bool Write(const std::vector<Bytes>& pieces) {
-        errno = 0;
-        std::ofstream out(path_, std::ios::binary | std::ios::trunc);
-        exists_ = out.is_open();
-        for (const Bytes& bytes : pieces) {
-            out.write(reinterpret_cast<const char*>(bytes.data()),
-                      static_cast<std::streamsize>(bytes.size()));
-        }
-        out.close();
-        return exists_ && !out.fail();
+        exists_ = true;
+        return WritePieces(path_, pieces);
     }
 
     std::error_code MoveTo(const std::filesystem::path& target) {

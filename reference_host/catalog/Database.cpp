@@ -7,6 +7,8 @@
 #include <cerrno>
 #include <utility>
 
+#include "reference_host/system/ErrorNumber.h"
+
 namespace catalog {
 namespace {
 
@@ -104,8 +106,9 @@ void Database::Fail(int code) {
     if (!handle_) {
         throw DatabaseError(code, words, 0, file_);
     }
+    const auto systemError = static_cast<unsigned long>(sqlite3_system_errno(handle_.get()));
     throw DatabaseError(sqlite3_extended_errcode(handle_.get()), words,
-                        sqlite3_system_errno(handle_.get()), file_);
+                        systemError == 0 ? 0 : host::system::ErrorNumber(systemError), file_);
 }
 
 void Database::Run(const char* sql) {

@@ -15,6 +15,7 @@
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/cliphost/Session.h"
+#include "reference_host/system/FileSystem.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 
@@ -46,6 +47,17 @@ bool ChangesNoOutput(const std::string& argument) {
 std::string DigestTextOfFile(const std::filesystem::path& file) {
     const std::optional<Digest> digest = DigestOfFile(file);
     return digest ? TextOf(*digest) : "none";
+}
+
+// Of an output's name in the form of the lines; empty: it is none.
+std::filesystem::path PathOfName(const std::string& name) {
+    std::string text;
+    return host::text::PercentDecoded(name, text) ? host::system::PathOfText(text)
+                                                  : std::filesystem::path();
+}
+
+std::string KeyOfOutput(const std::filesystem::path& output) {
+    return host::system::PathText(host::system::NameKey(output));
 }
 
 std::string BytesOfDigest(const std::string& text) {
@@ -112,8 +124,8 @@ std::vector<std::filesystem::path> DoneMovies::Load() {
         }
     }
     outputsByOwner_.clear();
-    for (const auto& [output, owner] : owners_) {
-        outputsByOwner_.emplace(owner.movie, output);
+    for (const auto& [key, owner] : owners_) {
+        outputsByOwner_.emplace(owner.movie, owner.output);
     }
     std::sort(unread.begin(), unread.end());
     return unread;
@@ -121,8 +133,8 @@ std::vector<std::filesystem::path> DoneMovies::Load() {
 
 // The files come in any order; the date tells which line is the last.
 void DoneMovies::NoteOwner(const std::string& movie, const std::string& output, std::int64_t date) {
-    Owner owner{date, BytesOfDigest(movie)};
-    Owner& last = owners_[output];
+    Owner owner{date, BytesOfDigest(movie), output};
+    Owner& last = owners_[KeyOfOutput(PathOfName(output))];
     if (last.movie.empty() || std::tie(last.date, last.movie) < std::tie(owner.date, owner.movie)) {
         last = std::move(owner);
     }
@@ -190,17 +202,15 @@ std::vector<std::filesystem::path> DoneMovies::OutputsOf(const std::filesystem::
     const auto [first, last] =
         outputsByOwner_.equal_range(BytesOfDigest(AbsoluteMachinePath(movie)));
     std::for_each(first, last, [&](const auto& entry) {
-        std::string name;
-        if (host::text::PercentDecoded(entry.second, name)) {
-            outputs.push_back(host::system::PathOfText(name));
+        if (std::filesystem::path name = PathOfName(entry.second); !name.empty()) {
+            outputs.push_back(std::move(name));
         }
     });
     return outputs;
 }
 
 bool DoneMovies::Keeps(const std::filesystem::path& output) const {
-    return owners_.count(PercentEncoded(host::system::PathText(output))) > 0 &&
-           StateOf(outFolder_ / output);
+    return owners_.count(KeyOfOutput(output)) > 0 && StateOf(outFolder_ / output);
 }
 
 void DoneMovies::Begin() {

@@ -70,8 +70,9 @@ private:
     struct Owner {
         std::int64_t date = 0;  // of the output
         std::string movie;
+        std::string output;
     };
-    std::unordered_map<std::string, Owner> owners_;  // by the output
+    std::unordered_map<std::string, Owner> owners_;  // by the name key of the output
     std::unordered_multimap<std::string, std::string> outputsByOwner_;
     std::filesystem::path written_;
     host::system::OutputStream stream_;

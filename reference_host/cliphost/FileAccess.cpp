@@ -90,9 +90,19 @@ const char* KindOf(std::filesystem::file_type type) {
 
 }  // namespace
 
+Problem WhyNoPath(const std::filesystem::path& path, const char* hint) {
+    if (const std::string reason = host::system::NameProblem(path); !reason.empty()) {
+        return {path, reason, hint};
+    }
+    if (const std::string reason = host::system::LengthProblem(path); !reason.empty()) {
+        return {path, reason, "turn its setting LongPathsEnabled on, or take a shorter path"};
+    }
+    return {};
+}
+
 Problem WhyUnreachable(const std::filesystem::path& path) {
-    if (const std::string problem = host::system::NameProblem(path); !problem.empty()) {
-        return {path, problem, "give the name that the file has"};
+    if (Problem problem = WhyNoPath(path, "give the name that the file has")) {
+        return problem;
     }
     const int error = ReachError(path);
     return error == 0 ? Problem() : OutOfReach(path, error);

@@ -6,6 +6,9 @@
 
 namespace cliphost {
 
+// Why nothing has this path; `hint` is what helps against a name that nothing can have.
+Problem WhyNoPath(const std::filesystem::path& path, const char* hint);
+
 // Why a file or folder can't be reached by its path: a part of the way that is
 // missing, closed or no folder, and links that lead nowhere or in a circle.
 // Nothing when it is there.

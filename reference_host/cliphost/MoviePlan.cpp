@@ -13,6 +13,7 @@
 #include "reference_host/cliphost/FolderTree.h"
 #include "reference_host/cliphost/MachinePath.h"
 #include "reference_host/cliphost/Words.h"
+#include "reference_host/system/FileSystem.h"
 #include "reference_host/system/Paths.h"
 
 namespace cliphost {
@@ -118,7 +119,7 @@ private:
     }
 
     bool Takes(const std::filesystem::path& name) {
-        return names_.taken.insert(name.native()).second;
+        return names_.taken.insert(host::system::NameKey(name).native()).second;
     }
 
     // 0 for a movie that is in no record. One that is given twice has two outputs.
@@ -138,7 +139,8 @@ private:
     // The record of a run that goes on meanwhile, on another share, changes no number: what it
     // holds was given in this way.
     unsigned NewNumber(const std::filesystem::path& movie) {
-        unsigned& number = names_.lastNumbers[OutputName(movie, 1, ending_).native()];
+        unsigned& number =
+            names_.lastNumbers[host::system::NameKey(OutputName(movie, 1, ending_)).native()];
         for (;;) {
             const std::filesystem::path name = OutputName(movie, ++number, ending_);
             if (!(done_ && done_->Keeps(name)) && Takes(name)) {

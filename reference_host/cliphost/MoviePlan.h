@@ -22,7 +22,7 @@ namespace cliphost {
 class DoneMovies;
 
 // The names that outputs have, where plans follow each other: a movie that comes again keeps its
-// own.
+// own. Of outputs these are name keys.
 struct OutputNames {
     using Name = std::filesystem::path::string_type;
     std::unordered_set<Name> taken;

@@ -18,6 +18,7 @@
 #include "reference_host/cliphost/WorkerVerb.h"
 #include "reference_host/framework/HostPath.h"
 #include "reference_host/system/DelayedSignals.h"
+#include "reference_host/system/FileSystem.h"
 #include "reference_host/system/OutputStream.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/system/ScratchFolder.h"
@@ -418,7 +419,7 @@ std::filesystem::path MoviesRun::TargetFor(std::size_t place, const MovieStep& s
     }
     for (unsigned number = 1; target.empty(); ++number) {
         const std::filesystem::path name = OutputName(step.movie, number, ending_);
-        if (targetsTaken_.insert(name.native()).second) {
+        if (targetsTaken_.insert(host::system::NameKey(name).native()).second) {
             target = options_.outFolder / name;
         }
     }

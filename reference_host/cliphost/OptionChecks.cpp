@@ -10,6 +10,7 @@
 #include "reference_host/cliphost/Failure.h"
 #include "reference_host/cliphost/OutputFile.h"
 #include "reference_host/framework/HostPath.h"
+#include "reference_host/system/FileSystem.h"
 #include "reference_host/system/Paths.h"
 #include "reference_host/util/text/FileUrl.h"
 #include "reference_host/util/text/Number.h"
@@ -132,7 +133,8 @@ bool IsPlaceOf(const std::filesystem::path& output, const std::filesystem::path&
         return std::filesystem::weakly_canonical(host::system::WholePath(path), error);
     };
     const std::filesystem::path place = whole(output);
-    return (!error && place == whole(file)) || std::filesystem::equivalent(output, file, error);
+    return (!error && host::system::NameKey(place) == host::system::NameKey(whole(file))) ||
+           std::filesystem::equivalent(output, file, error);
 }
 
 void RefuseOutputOnto(const std::filesystem::path& output, const std::vector<CallFile>& files) {

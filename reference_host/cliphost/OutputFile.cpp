@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "reference_host/cliphost/Failure.h"
+#include "reference_host/cliphost/FileAccess.h"
 #include "reference_host/cliphost/OutputProblem.h"
 #include "reference_host/system/Access.h"
 #include "reference_host/system/Paths.h"
@@ -17,8 +18,8 @@ using host::system::DescriptorOf;
 using host::system::IsStandardOutput;
 
 void RefuseName(const std::filesystem::path& output) {
-    if (const std::string problem = host::system::NameProblem(output); !problem.empty()) {
-        throw Failure(kExitCaller, output, problem, "take another name");
+    if (Problem problem = WhyNoPath(output, "take another name")) {
+        throw Failure(kExitCaller, std::move(problem));
     }
 }
 

@@ -276,9 +276,11 @@ void AddSettingsFile(CLI::App& app) {
             return std::string();
         },
         "", "NameForLibraries");
-    app.set_config("--config", host::system::PathText(DefaultSettingsFile()),
-                   "Read options from this file instead of ~/.config/cliphost.toml; those of the "
-                   "command line win over it")
+    app.set_config(
+           "--config", host::system::PathText(DefaultSettingsFile()),
+           fmt::format("Read options from this file instead of {}cliphost.toml; those of the "
+                       "command line win over it",
+                       host::system::kSettingsFolderInWords))
         ->transform(toOpen);
     app.add_flag(kNoSettingsFile, "Read no such file")->configurable(false);
     app.config_formatter(std::make_shared<SettingsReader>(app));

@@ -239,14 +239,16 @@ public:
     NamedChannel& operator=(const NamedChannel&) = delete;
 };
 
-// What ends its processes when we end, however we do.
-OwnedHandle MakeJob() {
-    OwnedHandle job(CreateJobObjectW(nullptr, nullptr));
+// What ends its processes when we end, however we do. 0, or the system's error.
+DWORD MakeJob(OwnedHandle& job) {
     JOBOBJECT_EXTENDED_LIMIT_INFORMATION limits{};
     limits.BasicLimitInformation.LimitFlags =
         JOB_OBJECT_LIMIT_KILL_ON_JOB_CLOSE | JOB_OBJECT_LIMIT_DIE_ON_UNHANDLED_EXCEPTION;
-    SetInformationJobObject(job.get(), JobObjectExtendedLimitInformation, &limits, sizeof limits);
-    return job;
+    job = OwnedHandle(CreateJobObjectW(nullptr, nullptr));
+    const bool isMade =
+        job.IsOpen() && SetInformationJobObject(job.get(), JobObjectExtendedLimitInformation,
+                                                &limits, sizeof limits);
+    return isMade ? 0 : GetLastError();
 }
 
 HANDLE channelToParent = INVALID_HANDLE_VALUE;
@@ -292,9 +294,14 @@ int ChildProcess::Start(const std::filesystem::path& program,
     const OwnedHandle nowhere(CreateFileW(L"NUL", GENERIC_READ | GENERIC_WRITE,
                                           FILE_SHARE_READ | FILE_SHARE_WRITE, &inherited,
                                           OPEN_EXISTING, 0, nullptr));
+    if (!nowhere.IsOpen()) {
+        return LastErrorNumber();
+    }
+    if (const DWORD error = MakeJob(ends->job)) {
+        return ErrorNumber(error);
+    }
     Inherited handles({nowhere.get(), errors.get(), channel.get()});
-    ends->job = MakeJob();
-    if (!nowhere.IsOpen() || !handles.IsReady() || !ends->job.IsOpen()) {
+    if (!handles.IsReady()) {
         return LastErrorNumber();
     }
     STARTUPINFOEXW start{};

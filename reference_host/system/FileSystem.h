@@ -24,8 +24,10 @@ VolumeFacts ReadVolumeFacts(const std::filesystem::path& folder);
 // Last write, seconds from 1970-01-01 UTC; 0 when it can't be read.
 std::uint64_t LastWrite(const std::filesystem::path& file);
 
-// The character by which names are told apart: itself, or its lower case where
+// The character by which names are told apart: itself, or its capital where
 // names that differ in case only are one name.
 char32_t NameCharacter(char32_t c);
+// A path in these characters: of two that are equal, each names the other's file.
+std::filesystem::path NameKey(const std::filesystem::path& path);
 
 }  // namespace host::system

@@ -110,4 +110,8 @@ char32_t NameCharacter(char32_t c) {
     return c;
 }
 
+std::filesystem::path NameKey(const std::filesystem::path& path) {
+    return path;
+}
+
 }  // namespace host::system

@@ -4,7 +4,6 @@
 
 #include <windows.h>
 
-#include <cwctype>
 #include <iterator>
 
 #include "text/Encodings.h"
@@ -30,6 +29,14 @@ std::uint32_t VolumeType(const wchar_t* root) {
         default:
             return 0;
     }
+}
+
+// By the rules of file names, which are those of no language; units stay in their places.
+std::wstring Capitals(std::wstring text) {
+    const auto size = static_cast<int>(text.size());
+    LCMapStringEx(LOCALE_NAME_INVARIANT, LCMAP_UPPERCASE, text.c_str(), size, text.data(), size,
+                  nullptr, nullptr, 0);
+    return text;
 }
 
 }  // namespace
@@ -64,7 +71,11 @@ std::uint64_t LastWrite(const std::filesystem::path& file) {
 }
 
 char32_t NameCharacter(char32_t c) {
-    return c <= 0xFFFF ? static_cast<char32_t>(std::towlower(static_cast<wint_t>(c))) : c;
+    return c <= 0xFFFF ? Capitals({static_cast<wchar_t>(c)}).front() : c;
+}
+
+std::filesystem::path NameKey(const std::filesystem::path& path) {
+    return Capitals(path.native());
 }
 
 }  // namespace host::system

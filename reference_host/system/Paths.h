@@ -52,6 +52,9 @@ std::filesystem::path PathOfPlace(const std::string& machine, const std::string&
 
 // Why no file can be called so, though the system may not say it; empty: nothing is wrong.
 std::string NameProblem(const std::filesystem::path& path);
+// The same of a path that is longer than the system is set up for, of which it says only that
+// nothing is there.
+std::string LengthProblem(const std::filesystem::path& path);
 
 // Whether a component holds a backslash of its own, so that the module's form
 // can't name it. Never on Windows.

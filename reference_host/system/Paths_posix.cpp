@@ -73,6 +73,10 @@ std::string NameProblem(const std::filesystem::path&) {
     return {};
 }
 
+std::string LengthProblem(const std::filesystem::path&) {
+    return {};  // the system says so itself
+}
+
 bool HoldsBackslash(const std::filesystem::path& path) {
     return path.native().find('\\') != std::string::npos;
 }

@@ -9,6 +9,20 @@
 #include "text/Encodings.h"
 
 namespace host::system {
+namespace {
+
+// The form of an absolute path that has no limit of length.
+std::wstring Unlimited(const std::wstring& path) {
+    const bool isOfServer = path.compare(0, 2, L"\\\\") == 0;
+    return isOfServer ? L"\\\\?\\UNC" + path.substr(1) : L"\\\\?\\" + path;
+}
+
+DWORD WhyNotThere(const std::wstring& path) {
+    return GetFileAttributesW(path.c_str()) == INVALID_FILE_ATTRIBUTES ? GetLastError()
+                                                                       : ERROR_SUCCESS;
+}
+
+}  // namespace
 
 bool ToSystemPath(std::u32string_view path, std::filesystem::path& out) {
     std::wstring units;
@@ -80,6 +94,17 @@ std::filesystem::path PathOfPlace(const std::string& machine, const std::string&
 
 std::string NameProblem(const std::filesystem::path& path) {
     return text::WindowsPathProblem(PathText(path));
+}
+
+std::string LengthProblem(const std::filesystem::path& path) {
+    constexpr std::size_t kLongest = MAX_PATH - 1;
+    const std::wstring whole = AbsolutePath(path).native();
+    // A system that takes long paths says the same of both forms.
+    if (whole.size() <= kLongest || WhyNotThere(whole) == WhyNotThere(Unlimited(whole))) {
+        return {};
+    }
+    return "its path has " + std::to_string(whole.size()) +
+           " characters, and this system is set up for " + std::to_string(kLongest);
 }
 
 bool HoldsBackslash(const std::filesystem::path&) {

@@ -20,6 +20,8 @@ std::vector<std::string> CommandLineWords(int argc, char** argv);
 
 // Where a user's settings lie; empty: nothing tells.
 std::filesystem::path SettingsFolder();
+// The same as people call it.
+extern const char* const kSettingsFolderInWords;
 
 // The file that runs. `name` is what the caller called it.
 std::filesystem::path ProgramFile(const char* name);

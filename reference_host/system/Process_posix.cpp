@@ -32,6 +32,8 @@ std::vector<std::string> CommandLineWords(int argc, char** argv) {
     return words;
 }
 
+const char* const kSettingsFolderInWords = "~/.config/";
+
 std::filesystem::path SettingsFolder() {
     const auto folder = [](const char* variable) {
         const char* const value = std::getenv(variable);

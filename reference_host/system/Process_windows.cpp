@@ -22,17 +22,10 @@ bool IsConsole(DWORD stream) {
     return GetConsoleMode(GetStdHandle(stream), &mode) != 0;
 }
 
-// The console is the caller's, who may go on with another program.
-void PrintUtf8() {
-    static const UINT before = GetConsoleOutputCP();
-    if (before != 0 && before != CP_UTF8 && SetConsoleOutputCP(CP_UTF8)) {
-        std::atexit([] { SetConsoleOutputCP(before); });
-    }
-}
-
 }  // namespace
 
 void PrepareProcess() {
+    EndByEvents();
     // Nobody may sit there to close a window.
     SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOGPFAULTERRORBOX | SEM_NOOPENFILEERRORBOX);
     for (const int stream : {0, 1, 2}) {
@@ -58,6 +51,8 @@ std::vector<std::string> CommandLineWords(int argc, char** argv) {
     LocalFree(parted);
     return words;
 }
+
+const char* const kSettingsFolderInWords = "%APPDATA%\\";
 
 std::filesystem::path SettingsFolder() {
     const wchar_t* const folder = _wgetenv(L"APPDATA");

@@ -10,9 +10,12 @@ namespace host::system {
 // The temporary name in the same folder under which a file is written. A link stays
 // a link: the file that it points to is replaced.
 // A file that was not finished is removed: when the object ends, and when a signal
-// ends the program, such as an interrupt from the keyboard.
+// ends the program, such as an interrupt from the keyboard; then also the one that a
+// library writes first, which has kWriterEnding behind this name.
 class UnfinishedFile {
 public:
+    static constexpr char kWriterEnding[] = ".part";
+
     explicit UnfinishedFile(const std::filesystem::path& place);
     ~UnfinishedFile();
     UnfinishedFile(const UnfinishedFile&) = delete;

@@ -21,6 +21,7 @@ struct Slot {
     std::atomic<bool> isTaken{false};
     std::atomic<bool> isNamed{false};
     char name[PATH_MAX] = {};
+    char writersName[PATH_MAX] = {};
 };
 Slot slots[4];
 
@@ -35,9 +36,11 @@ void WatchSignals() {
 }
 
 int TakeSlot(const std::string& name) {
-    for (std::size_t i = 0; i < std::size(slots) && name.size() < PATH_MAX; ++i) {
+    const std::string writersName = name + UnfinishedFile::kWriterEnding;
+    for (std::size_t i = 0; i < std::size(slots) && writersName.size() < PATH_MAX; ++i) {
         if (!slots[i].isTaken.exchange(true)) {
             std::memcpy(slots[i].name, name.c_str(), name.size() + 1);
+            std::memcpy(slots[i].writersName, writersName.c_str(), writersName.size() + 1);
             slots[i].isNamed = true;
             return static_cast<int>(i);
         }
@@ -59,7 +62,7 @@ std::filesystem::path BehindLinks(std::filesystem::path path) {
 }
 
 // The place's own name shows whose part it is. One that leaves no room for more
-// is told by a number; a writer may put a few letters behind this name again.
+// is told by a number; a writer may put its ending behind this name again.
 std::filesystem::path NameBeside(const std::filesystem::path& place) {
     constexpr std::size_t kRoom = 32;
     const std::string name = place.filename().native();
@@ -75,6 +78,7 @@ extern "C" void EndBySignal(int signal) {
     for (Slot& slot : slots) {
         if (slot.isNamed) {
             unlink(slot.name);
+            unlink(slot.writersName);
         }
     }
     // The signal comes again once this returns, and then ends the program.

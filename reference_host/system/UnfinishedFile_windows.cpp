@@ -24,9 +24,6 @@ BOOL WINAPI EndByEvent(DWORD event) {
     return TRUE;
 }
 
-// Before all others: who comes later is asked first, such as who only notes that the run is to end.
-[[maybe_unused]] const BOOL isAsked = SetConsoleCtrlHandler(EndByEvent, TRUE);
-
 int Keep(const std::filesystem::path& file) {
     const std::lock_guard<std::mutex> held(lock);
     names[nextNumber] = AbsolutePath(file).native();
@@ -50,7 +47,7 @@ std::filesystem::path BehindLinks(const std::filesystem::path& path) {
 }
 
 // The place's own name shows whose part it is. One that leaves no room for more is told by a
-// number; a writer may put a few letters behind this name again.
+// number; a writer may put its ending behind this name again.
 std::filesystem::path NameBeside(const std::filesystem::path& place) {
     constexpr std::size_t kLongestName = 255;
     constexpr std::size_t kRoom = 32;
@@ -79,13 +76,20 @@ bool Move(const std::filesystem::path& from, const std::filesystem::path& to, DW
 
 }  // namespace
 
+void EndByEvents() {
+    SetConsoleCtrlHandler(EndByEvent, TRUE);
+}
+
 extern "C" void EndBySignal(int signal) {
     {
         const std::lock_guard<std::mutex> held(lock);
         for (const auto& name : names) {
             DeleteFileW(name.second.c_str());
+            DeleteFileW(
+                (std::filesystem::path(name.second) += UnfinishedFile::kWriterEnding).c_str());
         }
     }
+    PutConsoleBack();
     TerminateProcess(GetCurrentProcess(), signal == SIGINT
                                               ? static_cast<UINT>(STATUS_CONTROL_C_EXIT)
                                               : 128u + static_cast<UINT>(signal));

@@ -8,6 +8,8 @@
 #include <string>
 #include <utility>
 
+#include "reference_host/system/ErrorNumber.h"
+
 // What the Windows halves share.
 namespace host::system {
 
@@ -36,8 +38,6 @@ private:
     HANDLE handle_;
 };
 
-// The C library's number for an error of the system, by which the host tells errors apart.
-int ErrorNumber(DWORD error);
 inline int LastErrorNumber() {
     return ErrorNumber(GetLastError());
 }
@@ -51,6 +51,15 @@ OwnedHandle OpenThere(const std::filesystem::path& path, DWORD access);
 // Ends a call that goes on by itself, if it still does: its memory is the caller's again. The call
 // has an event.
 void EndCall(HANDLE file, OVERLAPPED& call);
+
+// Lets Ctrl+C and the like end the program as a signal does, unless somebody takes them who asks
+// for them later. To be called by the program, not by a library that has a copy of all this.
+void EndByEvents();
+
+// Has the console take UTF-8. It is the caller's, who may go on with another program, so it is put
+// back at the end.
+void PrintUtf8();
+void PutConsoleBack();
 
 // Set from when a signal has come until it is waited for anew.
 HANDLE SignalEvent();

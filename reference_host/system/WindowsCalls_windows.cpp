@@ -2,21 +2,17 @@
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/WindowsCalls.h"
 
-#include <cerrno>
-#include <system_error>
+#include <atomic>
+#include <cstdlib>
 
 #include "text/Encodings.h"
 
 namespace host::system {
+namespace {
 
-int ErrorNumber(DWORD error) {
-    if (error == ERROR_NO_DATA || error == ERROR_BROKEN_PIPE) {
-        return EPIPE;
-    }
-    const std::error_condition plain =
-        std::system_category().default_error_condition(static_cast<int>(error));
-    return plain.category() == std::generic_category() ? plain.value() : EIO;
-}
+std::atomic<UINT> codePageBefore = 0;  // 0: it is as it was
+
+}  // namespace
 
 std::string ErrorWords(DWORD error) {
     wchar_t words[1024];
@@ -41,6 +37,20 @@ void EndCall(HANDLE file, OVERLAPPED& call) {
     // The event may be other calls', too, so it doesn't tell that this one has ended.
     while (!HasOverlappedIoCompleted(&call)) {
         WaitForSingleObject(call.hEvent, 1);
+    }
+}
+
+void PrintUtf8() {
+    const UINT before = GetConsoleOutputCP();
+    if (before != 0 && before != CP_UTF8 && SetConsoleOutputCP(CP_UTF8)) {
+        codePageBefore = before;
+        std::atexit(PutConsoleBack);
+    }
+}
+
+void PutConsoleBack() {
+    if (const UINT before = codePageBefore.exchange(0)) {
+        SetConsoleOutputCP(before);
     }
 }
 

@@ -12,66 +12,17 @@ import concurrent.futures
 import os
 import re
 import shutil
-import subprocess
 import sys
 from pathlib import Path
+
+from systems import Linux, Windows
 
 PINNED = ["--pin-time", "2026-01-31T12:00:00Z"]
 # What two runs, or two systems, have not in common.
 PASSING = [
     (re.compile(r'("made": ?)"[^"]*"'), r"\1"),  # when a report was made
-    (re.compile(r"\b\d+(\.\d+)? s\b"), "some s"),  # how long the checks of a module took
     (re.compile(r"\b(libcom-api\.so|AAFCOAPI\.dll)"), "AAF LIBRARY"),
 ]
-
-
-class Linux:
-    """The program of this system."""
-
-    def __init__(self, program, work):
-        self.program = [str(program)]
-        self.home = str(program.parent)
-        self.folder = work / "linux"
-        self.environment = dict(os.environ, XDG_CONFIG_HOME="/none", LC_ALL="C.UTF-8")
-
-    def path(self, path):
-        return str(path)
-
-    def run(self, call, folder, seconds=600):
-        done = subprocess.run([*self.program, *call], cwd=folder, env=self.environment, timeout=seconds,
-                              stdin=subprocess.DEVNULL, capture_output=True)
-        return done.returncode, done.stdout, done.stderr
-
-
-class Windows(Linux):
-    """The folder for Windows, copied to where it was not made, under Wine."""
-
-    def __init__(self, laid_out, work):
-        prefix = work / "wine"
-        self.environment = dict(os.environ, WINEPREFIX=str(prefix), WINEDEBUG="-all", WINEARCH="win64",
-                                WINEDLLOVERRIDES="mscoree,mshtml,winemenubuilder.exe=", LC_ALL="C.UTF-8")
-        self.environment.pop("DISPLAY", None)
-        self.wine = shutil.which("wine64") or "/usr/lib/wine/wine64"
-        home = prefix / "drive_c" / "médiâ tools"
-        if not home.parent.is_dir():
-            self.program = [self.wine, "wineboot"]
-            self.run(["--init"], work)
-        shutil.rmtree(home, ignore_errors=True)
-        shutil.copytree(laid_out, home)
-        self.home = r"C:\médiâ tools"
-        self.program = [self.wine, self.home + r"\cliphost.exe"]
-        self.folder = work / "windows"
-        # While a program runs, Wine's services stay; they would start and stop for each call, and some break at it.
-        self.waiting = subprocess.Popen([self.wine, "cmd"], env=self.environment, stdin=subprocess.PIPE,
-                                        stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
-
-    def path(self, path):
-        return "Z:" + str(path).replace("/", "\\")
-
-    def stop(self):
-        self.waiting.communicate()
-        server = shutil.which("wineserver") or "/usr/lib/wine/wineserver64"
-        subprocess.run([server, "-k"], env=self.environment, check=False)
 
 
 def plain(text, side):
@@ -201,6 +152,22 @@ def calls_of_all(places):
                 yield list(movie_calls(place, movie))
 
 
+# Scripts, emoji, letters of two parts, and what shells and URLs take for something else.
+NAMES = ["映画 🎬 ü.mov", "ملف.mov", "сцена №1.mov", "u\u0308 of two parts.mov", "it's 100% #1 & 50%41 +^;=.mov"]
+
+
+def make_named_movies(movie, work):
+    """Folders of a movie's copies: under such names, and at the end of a path of more than 260 characters."""
+    names = work / "names"
+    far = work.joinpath("far", *(f"folder {number} of a long path" + "." * 20 + "x" for number in range(6)))
+    for folder, copies in ((names, NAMES), (far, ["far away.mov"])):
+        shutil.rmtree(folder, ignore_errors=True)
+        folder.mkdir(parents=True)
+        for name in copies:
+            shutil.copy2(movie, folder / name)
+    return {"names": names, "far": far}
+
+
 def main(laid_out, program, movies, types, work, media=None):
     work = Path(work).resolve()
     work.mkdir(parents=True, exist_ok=True)
@@ -211,6 +178,7 @@ def main(laid_out, program, movies, types, work, media=None):
             if places[name].is_symlink():
                 places[name].unlink()
             places[name].symlink_to(Path(folder).resolve())
+    places.update(make_named_movies(places["movies"] / "h264_with_aac.mov", work))
     windows = Windows(Path(laid_out).resolve(), work)
     comparison = Comparison(Linux(Path(program).resolve(), work), windows, places)
     try:

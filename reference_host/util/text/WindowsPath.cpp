@@ -98,6 +98,9 @@ std::string WindowsPathProblem(std::string_view path) {
         return "it names a device";
     }
     const std::string plain = WithoutVerbatimStart(path);
+    if (BeginsWith(plain, kVerbatim)) {
+        return R"(behind \\?\ stands neither a drive nor a share)";
+    }
     std::string_view rest = plain;
     rest.remove_prefix(BeginsWithDrive(rest) ? 2 : 0);
     while (!rest.empty()) {

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <cerrno>
+
 #include "tests/support/TestFolder.h"
 
 using namespace catalog;
@@ -62,6 +64,7 @@ TEST(Database, TellsTheKindsOfErrors) {
         return DatabaseError(0, "none");
     };
     EXPECT_TRUE(errorOf(folder / "missing", kRead, "SELECT 1").CantOpen());
+    EXPECT_EQ(errorOf(folder / "no/folder", kMake, "SELECT 1").SystemError(), ENOENT);
     const auto text = folder.Write("text", std::string(5000, 'x'));
     EXPECT_TRUE(errorOf(text, kRead, "PRAGMA user_version").IsNoDatabase());
     EXPECT_FALSE(errorOf(text, kRead, "PRAGMA user_version").IsDamaged());

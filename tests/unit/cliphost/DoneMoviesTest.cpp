@@ -125,6 +125,7 @@ TEST_F(DoneMoviesTest, KeepTheOutputsThatAreThere) {
     DoneMovies done(folder_.path(), "s");
     done.Load();
     EXPECT_TRUE(done.Keeps("a b.aaf"));
+    EXPECT_EQ(done.Keeps("A B.AAF"), std::filesystem::exists(folder_ / "A B.AAF"));
     EXPECT_FALSE(done.Keeps("b.aaf")) << "no run made it";
     std::filesystem::remove(folder_ / "a b.aaf");
     EXPECT_FALSE(done.Keeps("a b.aaf"));

@@ -14,6 +14,7 @@
 #include "reference_host/system/Access.h"
 #include "reference_host/system/FileNumber.h"
 #include "reference_host/system/FileState.h"
+#include "reference_host/system/FileSystem.h"
 #include "reference_host/system/FolderWatch.h"
 #include "reference_host/system/OutputStream.h"
 #include "reference_host/system/Paths.h"
@@ -63,6 +64,18 @@ const char* const kNames[] = {
 };
 
 }  // namespace
+
+TEST_F(Files, AreFoundByTheNamesOfEqualKeys) {
+    Write("\xC3\xBC\xD0\xBA Clip.mov", "");
+    for (const char* const name :
+         {"\xC3\xBC\xD0\xBA Clip.mov", "\xC3\xBC\xD0\xBA CLIP.mov", "\xC3\xBC\xD0\x9A Clip.mov",
+          "\xC3\x9C\xD0\xBA Clip.mov", "u\xD0\xBA Clip.mov"}) {
+        const std::filesystem::path file = folder() / PathOfText(name);
+        EXPECT_EQ(std::filesystem::exists(file),
+                  NameKey(file) == NameKey(folder() / PathOfText("\xC3\xBC\xD0\xBA Clip.mov")))
+            << name;
+    }
+}
 
 TEST_F(Files, OfEveryScriptAreWrittenAndRead) {
     for (const char* const name : kNames) {

@@ -85,6 +85,7 @@ TEST(UnfinishedFile, IsRemovedWhenASignalEndsTheProgram) {
             const UnfinishedFile second(folder / "b.aaf");
             WriteFile(first.path(), "half");
             WriteFile(second.path(), "half");
+            WriteFile(second.path().native() + UnfinishedFile::kWriterEnding, "half");
             std::raise(signal);
         };
         EXPECT_EXIT(interrupted(), testing::KilledBySignal(signal), "");

@@ -57,6 +57,13 @@ TEST(WindowsPathProblem, CharactersThatNoNameHasAreTold) {
     }
 }
 
+TEST(WindowsPathProblem, VerbatimPathsNeedADriveOrAShare) {
+    for (const char* const path : {R"(\\?\Volume{1}\a.mov)", R"(\\?\a.mov)", R"(\\?\)"}) {
+        EXPECT_EQ(WindowsPathProblem(path), R"(behind \\?\ stands neither a drive nor a share)")
+            << path;
+    }
+}
+
 TEST(WindowsPathProblem, NamesAreMeasuredInUtf16) {
     std::string pairs;
     for (int i = 0; i < 127; ++i) {
