@@ -56,13 +56,13 @@ public:
         }
     }
 
-    bool Write(const std::vector<Bytes>& pieces) {
+    bool Write(const std::vector<Piece>& pieces) {
         errno = 0;
         std::ofstream out(path_, std::ios::binary | std::ios::trunc);
         exists_ = out.is_open();
-        for (const Bytes& bytes : pieces) {
-            out.write(reinterpret_cast<const char*>(bytes.data()),
-                      static_cast<std::streamsize>(bytes.size()));
+        for (const Piece& piece : pieces) {
+            out.write(reinterpret_cast<const char*>(piece.data),
+                      static_cast<std::streamsize>(piece.size));
         }
         out.close();
         return exists_ && !out.fail();
@@ -80,7 +80,7 @@ private:
     bool exists_ = false;
 };
 
-FileResult ReplaceFile(const std::vector<Bytes>& pieces, const std::filesystem::path& path) {
+FileResult ReplaceFile(const std::vector<Piece>& pieces, const std::filesystem::path& path) {
     TemporaryFile temporary(path);
     if (!temporary.Write(pieces)) {
         return SystemFailure(path, "cannot be written");
