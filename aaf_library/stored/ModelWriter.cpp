@@ -31,11 +31,13 @@ using Targets = std::set<Bytes>;
 
 constexpr std::size_t kIdSize = sizeof(StoredAuid);
 
-bool IsIn(Span<BuiltInDefinition> table, const Bytes& id) {
+// Null when it is not among them.
+const BuiltInDefinition* FindIn(Span<BuiltInDefinition> table, const Bytes& id) {
     const GUID wanted = GuidOf(id);
-    return std::any_of(table.begin(), table.end(), [&](const BuiltInDefinition& definition) {
-        return definition.id == wanted;
-    });
+    const auto* const found =
+        std::find_if(table.begin(), table.end(),
+                     [&](const BuiltInDefinition& definition) { return definition.id == wanted; });
+    return found == table.end() ? nullptr : found;
 }
 
 bool IsWeak(StoredForm form) {
@@ -468,17 +470,10 @@ private:
                     (IsCopy() && !Dictionary::IsSetOfDefinitions(pid))) {
                     continue;
                 }
-                const auto [set, isNew] = sets.try_emplace(pid);
-                if (isNew) {
-                    set->second = EmptyProperty(*from.classDefinition().FindProperty(pid));
-                }
-                AddDefinitions(set->second, value->objects(), stored);
+                AddDefinitions(SetIn(sets, from, pid), value->objects(), stored);
             }
         } while (stored.size() != before);
-        AddBuiltIn(prop::Dictionary_DataDefinitions, BuiltInDataDefinitions(),
-                   AUID_AAFDataDefinition, common_.dataDefinition, from, sets);
-        AddBuiltIn(prop::Dictionary_ContainerDefinitions, BuiltInContainerDefinitions(),
-                   AUID_AAFContainerDefinition, common_.containerDefinition, from, sets);
+        AddBuiltIn(from, sets);
         for (auto& set : sets) {
             if (!set.second.objects.empty()) {
                 out.properties.push_back(std::move(set.second));
@@ -528,12 +523,12 @@ private:
     // those here.
     bool IsWanted(PropertyId set, const Bytes& key, bool isTarget) const {
         const bool isContainer = set == prop::Dictionary_ContainerDefinitions.pid &&
-                                 IsIn(BuiltInContainerDefinitions(), key);
+                                 FindIn(BuiltInContainerDefinitions(), key) != nullptr;
         if (!IsCopy()) {
             return isTarget || !isContainer;
         }
-        const bool isData =
-            set == prop::Dictionary_DataDefinitions.pid && IsIn(BuiltInDataDefinitions(), key);
+        const bool isData = set == prop::Dictionary_DataDefinitions.pid &&
+                            FindIn(BuiltInDataDefinitions(), key) != nullptr;
         return isTarget && !isContainer && !isData;
     }
 
@@ -543,33 +538,48 @@ private:
         return found == targets_.end() ? nullptr : &found->second;
     }
 
-    // Those that are not there yet: programs that extend a file look for all definitions of data.
-    // They say what the built-in model says.
-    void AddBuiltIn(const PropertyKey& key, Span<BuiltInDefinition> table, const GUID& classId,
-                    StoredObject (*stored)(const BuiltInDefinition&), const Dictionary& from,
-                    std::map<PropertyId, StoredProperty>& sets) {
-        const bool areAllWanted = key.pid == prop::Dictionary_DataDefinitions.pid;
-        const Targets* const targets = TargetsIn(key.pid);
-        if (!areAllWanted && targets == nullptr) {
+    // Those that are not there yet. Programs that extend a file look for all definitions of data.
+    void AddBuiltIn(const Dictionary& from, std::map<PropertyId, StoredProperty>& sets) {
+        StoredProperty& data = SetIn(sets, from, prop::Dictionary_DataDefinitions.pid);
+        data.keys.reserve(data.keys.size() + BuiltInDataDefinitions().size());
+        data.objects.reserve(data.objects.size() + BuiltInDataDefinitions().size());
+        closure_.AddClass(AUID_AAFDataDefinition);
+        for (const BuiltInDefinition& entry : BuiltInDataDefinitions()) {
+            AddBuiltIn(data, entry, common_.dataDefinition);
+        }
+        const Targets* const containers = TargetsIn(prop::Dictionary_ContainerDefinitions.pid);
+        if (containers == nullptr) {
             return;
         }
-        const auto [place, isNew] = sets.try_emplace(key.pid);
-        StoredProperty& set = place->second;
-        if (isNew) {
-            set = EmptyProperty(*from.classDefinition().FindProperty(key.pid));
-        }
-        set.keys.reserve(set.keys.size() + table.size());
-        set.objects.reserve(set.objects.size() + table.size());
-        for (const BuiltInDefinition& entry : table) {
-            const StoredAuid id = AuidOf(entry.id);
-            const Bytes bytes(id.begin(), id.end());
-            if ((areAllWanted || targets->count(bytes) != 0) &&
-                std::find(set.keys.begin(), set.keys.end(), bytes) == set.keys.end()) {
-                closure_.AddClass(classId);
-                set.keys.push_back(bytes);
-                set.objects.push_back(stored(entry));
+        for (const Bytes& key : *containers) {
+            const BuiltInDefinition* const entry = FindIn(BuiltInContainerDefinitions(), key);
+            if (entry != nullptr) {
+                closure_.AddClass(AUID_AAFContainerDefinition);
+                AddBuiltIn(SetIn(sets, from, prop::Dictionary_ContainerDefinitions.pid), *entry,
+                           common_.containerDefinition);
             }
         }
+    }
+
+    static void AddBuiltIn(StoredProperty& set, const BuiltInDefinition& entry,
+                           StoredObject (*stored)(const BuiltInDefinition&)) {
+        const StoredAuid id = AuidOf(entry.id);
+        const auto isKey = [&id](const Bytes& key) {
+            return std::equal(key.begin(), key.end(), id.begin(), id.end());
+        };
+        if (std::none_of(set.keys.begin(), set.keys.end(), isKey)) {
+            set.keys.emplace_back(id.begin(), id.end());
+            set.objects.push_back(stored(entry));
+        }
+    }
+
+    StoredProperty& SetIn(std::map<PropertyId, StoredProperty>& sets, const Dictionary& from,
+                          PropertyId pid) {
+        const auto [place, isNew] = sets.try_emplace(pid);
+        if (isNew) {
+            place->second = EmptyProperty(*from.classDefinition().FindProperty(pid));
+        }
+        return place->second;
     }
 
     // Readers fail when a target is not where the reference says it is.
