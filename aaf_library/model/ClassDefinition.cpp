@@ -47,9 +47,13 @@ bool ClassDefinition::IsKindOf(const GUID& classId) const {
 }
 
 bool ClassDefinition::IsAsBuiltIn() const {
-    return !IsExtended() && !IsRenamed() &&
-           std::none_of(properties_.begin(), properties_.end(),
-                        [](const auto& property) { return property && property->IsRenamed(); });
+    return !IsExtended() && !IsRenamedAnywhere();
+}
+
+bool ClassDefinition::IsRenamedAnywhere() const {
+    return IsRenamed() ||
+           std::any_of(properties_.begin(), properties_.end(),
+                       [](const auto& property) { return property && property->IsRenamed(); });
 }
 
 // What a search looks at, of a row of the shared table or of a definition.
@@ -137,6 +141,7 @@ std::vector<PropertyDefinition*> ClassDefinition::RequiredProperties(const GUID&
 PropertyDefinition& ClassDefinition::AddProperty(const GUID& id, const std::wstring& name,
                                                  const GUID& typeId, bool optional, bool unique,
                                                  PropertyId pid) {
+    model()->TellChange();
     RefPtr<PropertyDefinition> property(
         new PropertyDefinition(*this, pid, typeId, optional, unique));
     property->JoinModel(*model());

@@ -32,6 +32,20 @@ public:
     const std::vector<RefPtr<PropertyDefinition>>& properties();
     // Whether it has more than the built-in model knows.
     bool IsExtended() const { return !IsBuiltIn() || properties_.size() > builtIn_.size(); }
+    // Itself, or a property that was looked up.
+    bool IsRenamedAnywhere() const;
+    // For each of its own properties to which the model allotted a number.
+    template <class Do>
+    void ForEachAllotted(const Do& use) const {
+        if (highest_ < kLastAllottedPid) {
+            return;
+        }
+        for (const RefPtr<PropertyDefinition>& property : properties_) {
+            if (property && property->pid() >= kLastAllottedPid) {
+                use(*property);
+            }
+        }
+    }
     // Whether all that it says stands in the built-in model.
     bool IsAsBuiltIn() const;
     // This class and its parents; null when unknown.

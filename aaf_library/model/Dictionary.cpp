@@ -94,10 +94,9 @@ bool Dictionary::IsSetOfDefinitions(PropertyId set) {
 }
 
 Object* Dictionary::FindMade(const PropertyKey& set, const GUID& id) const {
-    Bytes key;
-    key.reserve(kGuidSize);
-    AppendGuid(id, key);
-    return FindInSet(set, key.data(), key.size());
+    std::uint8_t key[kGuidSize];
+    PutGuid(id, key);
+    return FindInSet(set, key, sizeof key);
 }
 
 Object* Dictionary::Find(const PropertyKey& set, const GUID& id) const {

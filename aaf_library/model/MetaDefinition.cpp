@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/MetaDefinition.h"
 
+#include "aaf_library/model/Model.h"
 #include "aaf_library/model/Text.h"
 
 namespace aaf {
@@ -57,6 +58,7 @@ HRESULT MetaDefinition::SetName(aafCharacter_constptr name) {
     if (name == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
+    model()->TellChange();
     builtInName_ = nullptr;
     name_ = name;
     renamed_ = true;

@@ -247,6 +247,7 @@ HRESULT Model::RegisterClass(ClassDefinition& definition) {
     if (definition.IsRegistered() || FindClass(definition.id()) != nullptr) {
         return AAFRESULT_SUCCESS;
     }
+    TellChange();
     Enter(RefPtr<ClassDefinition>(&definition));
     return AAFRESULT_SUCCESS;
 }
@@ -258,6 +259,7 @@ HRESULT Model::RegisterType(TypeDefinition& type) {
     if (FindType(type.id()) != nullptr) {
         return AAFRESULT_SUCCESS;
     }
+    TellChange();
     Enter(RefPtr<TypeDefinition>(&type));
     // One reference of the model's is enough, a second would look like a caller's.
     const auto kept =
@@ -296,8 +298,28 @@ bool Model::HasProperty(const GUID& id) const {
     return FindProperty(id) != nullptr || FindBuiltInProperty(id) != nullptr;
 }
 
+AllottedNumbers Model::NumbersInACopy() const {
+    // What is built in comes behind, and the larger number first.
+    std::vector<std::pair<bool, int>> numbers;
+    for (const RefPtr<ClassDefinition>& definition : classes_) {
+        definition->ForEachAllotted([&](const PropertyDefinition& property) {
+            numbers.emplace_back(property.IsBuiltIn(), -int{property.pid()});
+        });
+    }
+    std::sort(numbers.begin(), numbers.end());
+    AllottedNumbers copied;
+    PropertyId next = kFirstAllottedPid;
+    for (const auto& number : numbers) {
+        copied.emplace(static_cast<PropertyId>(-number.second), next--);
+    }
+    return copied;
+}
+
 PropertyId Model::EnterProperty(PropertyDefinition& property) {
-    propertyById_[property.id()] = &property;
+    // FindProperty looks for built-in ones in their class.
+    if (!property.IsBuiltIn()) {
+        propertyById_[property.id()] = &property;
+    }
     return property.pid() != kNoPropertyId ? property.pid() : nextPropertyId_--;
 }
 

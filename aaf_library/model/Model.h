@@ -53,14 +53,6 @@ public:
     // A deep copy of an object of any model, free, with the definitions that it needs. Definitions
     // of properties and types which this model lacks are registered here.
     RefPtr<Object> CopyObject(const Object& source);
-    // The counterparts in this model of what another model has; they are registered where they are
-    // lacking. Null for a property that can't be had here.
-    ClassDefinition* ClassLike(const ClassDefinition& source);
-    PropertyDefinition* PropertyLike(ClassDefinition& owner, const PropertyDefinition& source);
-    // Registers the definitions that a value of another model refers to.
-    void CopyReferredTo(const PropertyValue& value);
-    // A parameter names its definition by a plain id.
-    void CopyParameterNamedBy(const PropertyValue& value);
 
     // -- For those who will copy what the objects hold now, as late as they can.
     class Copier {
@@ -73,7 +65,7 @@ public:
     };
     void LetWait(Copier& copier) { waiting_.push_back(&copier); }
     void LetGo(const Copier& copier);
-    // By whoever is about to change a value of an object.
+    // By whoever is about to change a value of an object, or a definition.
     void TellChange() {
         if (!waiting_.empty()) {
             CallWaiting();
@@ -104,8 +96,11 @@ public:
     PropertyDefinition* FindProperty(const GUID& id) const;
     // Whether any class has a property with that id, looked up yet or not.
     bool HasProperty(const GUID& id) const;
+    // The numbers that a copy of this model would allot, by those that are allotted here: first to
+    // what callers registered, then to what the built-in model leaves to each file.
+    AllottedNumbers NumbersInACopy() const;
     // False once all numbers are allotted.
-    bool HasFreePropertyId() const { return nextPropertyId_ >= 0x8000; }
+    bool HasFreePropertyId() const { return nextPropertyId_ >= kLastAllottedPid; }
     // By PropertyDefinitions as they come into being: their number, allotted when it is 0.
     PropertyId EnterProperty(PropertyDefinition& property);
     void ForgetProperty(PropertyDefinition& property);
@@ -124,7 +119,15 @@ private:
     // Into the set of that class or property, unless it has the id.
     template <class Set>
     void CopyDefinition(const Object* definition, const Set& set, const GUID& id);
+    // The counterparts in this model of what another model has; they are registered where they are
+    // lacking. Null for a property that can't be had here.
+    ClassDefinition* ClassLike(const ClassDefinition& source);
     TypeDefinition* TypeLike(const TypeDefinition& source);
+    PropertyDefinition* PropertyLike(ClassDefinition& owner, const PropertyDefinition& source);
+    // Registers the definitions that a value of another model refers to.
+    void CopyReferredTo(const PropertyValue& value);
+    // A parameter names its definition by a plain id.
+    void CopyParameterNamedBy(const PropertyValue& value);
     void CallWaiting();
     HRESULT CopyValue(const PropertyValue& source, Object& target, PropertyDefinition& property);
 
@@ -137,8 +140,8 @@ private:
     std::vector<RefPtr<TypeDefinition>> keptTypes_;
     std::unordered_map<GUID, ClassDefinition*, GuidHash> classById_;
     std::unordered_map<GUID, TypeDefinition*, GuidHash> typeById_;
-    std::unordered_map<GUID, PropertyDefinition*, GuidHash> propertyById_;
-    PropertyId nextPropertyId_ = 0xFFFF;
+    std::unordered_map<GUID, PropertyDefinition*, GuidHash> propertyById_;  // not built in
+    PropertyId nextPropertyId_ = kFirstAllottedPid;
     RefPtr<Dictionary> dictionary_;
     std::vector<Copier*> waiting_;
     std::vector<const Object*> copying_;  // definitions of others on their way into this model

@@ -48,22 +48,38 @@ HRESULT Object::RemoveValue(const PropertyKey& key) {
     return AAFRESULT_SUCCESS;
 }
 
+PropertyDefinition* Object::DefinitionOf(const PropertyKey& key) const {
+    PropertyDefinition* const property =
+        key.pid == kNoPropertyId ? class_->FindProperty(key.id) : class_->FindProperty(key.pid);
+    return property == nullptr || property->type() == nullptr ? nullptr : property;
+}
+
+PropertyValue* Object::EnterNew(const PropertyDefinition& property, RefPtr<PropertyValue> value) {
+    value->EnterObject(*this);
+    PropertyValue* added = value.get();
+    if (const RefPtr<PropertyValue> old = values_.Put(property.pid(), std::move(value))) {
+        old->LeaveObject();  // one that is kept as stored
+    }
+    return added;
+}
+
 PropertyValue* Object::RequireValue(const PropertyKey& key) {
     if (PropertyValue* present = FindValue(key)) {
         return present;
     }
-    PropertyDefinition* property =
-        key.pid == kNoPropertyId ? class_->FindProperty(key.id) : class_->FindProperty(key.pid);
-    if (property == nullptr || property->type() == nullptr) {
-        return nullptr;
+    const PropertyDefinition* const property = DefinitionOf(key);
+    return property == nullptr ? nullptr : EnterNew(*property, property->type()->NewValue());
+}
+
+PropertyValue* Object::PutBytes(const PropertyKey& key, Bytes bytes) {
+    if (PropertyValue* present = FindValue(key)) {
+        present->BytesToChange() = std::move(bytes);
+        return present;
     }
-    RefPtr<PropertyValue> value = property->type()->NewValue();
-    value->EnterObject(*this);
-    PropertyValue* added = value.get();
-    if (const RefPtr<PropertyValue> old = values_.Put(property->pid(), std::move(value))) {
-        old->LeaveObject();  // one that is kept as stored
-    }
-    return added;
+    const PropertyDefinition* const property = DefinitionOf(key);
+    return property == nullptr
+               ? nullptr
+               : EnterNew(*property, model()->NewValue(*property->type(), std::move(bytes)));
 }
 
 HRESULT Object::PutValue(PropertyId pid, PropertyValue* value) {

@@ -61,6 +61,7 @@ public:
     ClassDefinition& classDefinition() const { return *class_; }
     const GUID& classId() const;
     bool IsKindOf(const GUID& classId) const;
+    Object* AsObject() override { return this; }
     Object* owner() const { return owner_; }
     // The nearest owner that is a T, or null: FindOwner<ContentStorage>().
     template <class T>
@@ -91,6 +92,8 @@ public:
     HRESULT RemoveValue(const PropertyKey& key);
     // The value, made empty when absent. Null when the class has no such property.
     PropertyValue* RequireValue(const PropertyKey& key);
+    // The value with these bytes; null as above.
+    PropertyValue* PutBytes(const PropertyKey& key, Bytes bytes);
     // Sets or replaces a value object; the owner of what it contains becomes this object.
     HRESULT PutValue(PropertyId pid, PropertyValue* value);
     // Told when a value of this object comes, goes or is about to change. An object that joins a
@@ -219,6 +222,8 @@ private:
     friend class PropertyValue;
 
     PropertyId NumberOf(const PropertyKey& key) const;
+    PropertyDefinition* DefinitionOf(const PropertyKey& key) const;
+    PropertyValue* EnterNew(const PropertyDefinition& property, RefPtr<PropertyValue> value);
     // The definition, when it belongs to this object's class or a parent; else null.
     PropertyDefinition* OwnProperty(IAAFPropertyDef* propDef) const;
     HRESULT ReadInteger64(const PropertyKey& key, aafInt64* out) const;

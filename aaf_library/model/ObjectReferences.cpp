@@ -189,7 +189,7 @@ HRESULT Object::PutWeak(const PropertyKey& key, IUnknown* target) {
     Bytes id;
     const HRESULT result = WeakKey(key, target, &id);
     if (result >= 0) {
-        RequireValue(key)->BytesToChange() = std::move(id);
+        PutBytes(key, std::move(id));
     }
     return result;
 }
@@ -210,9 +210,8 @@ HRESULT Object::WeakKey(const PropertyKey& key, IUnknown* argument, Bytes* bytes
         return AAFRESULT_NULL_PARAM;
     }
     Unknown* target = ImplementationOf(argument);
-    PropertyDefinition* property =
-        key.pid == kNoPropertyId ? class_->FindProperty(key.id) : class_->FindProperty(key.pid);
-    if (property == nullptr || property->type() == nullptr) {
+    const PropertyDefinition* const property = DefinitionOf(key);
+    if (property == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
     const GUID* targetClass = TargetClassOf(*property->type());

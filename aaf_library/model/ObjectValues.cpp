@@ -64,12 +64,7 @@ HRESULT Object::PutString(const PropertyKey& key, aafCharacter_constptr text) {
     if (bytes.size() > 0xFFFF) {
         return AAFRESULT_BAD_SIZE;
     }
-    PropertyValue* value = RequireValue(key);
-    if (value == nullptr) {
-        return AAFRESULT_BAD_PROP;
-    }
-    value->BytesToChange() = std::move(bytes);
-    return AAFRESULT_SUCCESS;
+    return PutBytes(key, std::move(bytes)) == nullptr ? AAFRESULT_BAD_PROP : AAFRESULT_SUCCESS;
 }
 
 HRESULT Object::ReadString(const PropertyKey& key, aafCharacter* buffer,
@@ -100,15 +95,14 @@ HRESULT Object::PutNative(const PropertyKey& key, const void* data, std::size_t 
     if (data == nullptr) {
         return AAFRESULT_NULL_PARAM;
     }
-    PropertyDefinition* property =
-        key.pid == kNoPropertyId ? class_->FindProperty(key.id) : class_->FindProperty(key.pid);
-    if (property == nullptr || property->type() == nullptr) {
+    const PropertyDefinition* const property = DefinitionOf(key);
+    if (property == nullptr) {
         return AAFRESULT_BAD_PROP;
     }
     Bytes stored;
     const HRESULT result = property->type()->Encode(data, bytes, stored);
     if (result >= 0) {
-        RequireValue(key)->BytesToChange() = std::move(stored);
+        PutBytes(key, std::move(stored));
     }
     return result;
 }

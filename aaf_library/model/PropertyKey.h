@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <unordered_map>
+
 #include "host_interfaces/aaf/AAFPlainTypes.h"
 
 namespace aaf {
@@ -10,6 +12,12 @@ namespace aaf {
 // same everywhere; others are allotted by each model from 0xFFFF downwards.
 using PropertyId = aafUInt16;
 inline constexpr PropertyId kNoPropertyId = 0;
+// From here downwards models allot numbers to properties of their own.
+inline constexpr PropertyId kFirstAllottedPid = 0xFFFF;
+inline constexpr PropertyId kLastAllottedPid = 0x8000;
+
+// The numbers that stand for others.
+using AllottedNumbers = std::unordered_map<PropertyId, PropertyId>;
 
 // Names a built-in property; PropertyKeys.h lists them all. The number is
 // kNoPropertyId where each model allots its own.

@@ -31,11 +31,23 @@ inline aafInt64 SignedAt(const std::uint8_t* at, std::size_t size) {
     return static_cast<aafInt64>(UnsignedAt(at, size) << shift) >> shift;
 }
 
+inline constexpr std::size_t kGuidSize = 16;
+
+inline void PutGuid(const GUID& id, std::uint8_t* at) {
+    for (std::size_t i = 0; i < 4; ++i) {
+        at[i] = static_cast<std::uint8_t>(id.Data1 >> (8 * i));
+    }
+    for (std::size_t i = 0; i < 2; ++i) {
+        at[4 + i] = static_cast<std::uint8_t>(id.Data2 >> (8 * i));
+        at[6 + i] = static_cast<std::uint8_t>(id.Data3 >> (8 * i));
+    }
+    std::memcpy(at + 8, id.Data4, 8);
+}
+
 inline void AppendGuid(const GUID& id, Bytes& out) {
-    AppendNumber(id.Data1, 4, out);
-    AppendNumber(id.Data2, 2, out);
-    AppendNumber(id.Data3, 2, out);
-    out.insert(out.end(), id.Data4, id.Data4 + 8);
+    std::uint8_t bytes[kGuidSize];
+    PutGuid(id, bytes);
+    out.insert(out.end(), bytes, bytes + kGuidSize);
 }
 
 inline GUID GuidAt(const std::uint8_t* at) {
@@ -46,8 +58,6 @@ inline GUID GuidAt(const std::uint8_t* at) {
     std::memcpy(id.Data4, at + 8, 8);
     return id;
 }
-
-inline constexpr std::size_t kGuidSize = 16;
 
 // An indirect value: byte order mark, id of the type, the value in stored form.
 inline constexpr std::uint8_t kLittleEndianMark = 0x4C;

@@ -2,6 +2,8 @@
 // SPDX-License-Identifier: MIT
 #include "aaf_library/model/TypeExtendibleEnumeration.h"
 
+#include "aaf_library/model/Model.h"
+
 namespace aaf {
 
 HRESULT TypeExtendibleEnumeration::Setup(const GUID& id, const std::wstring& name,
@@ -157,6 +159,7 @@ HRESULT TypeExtendibleEnumeration::AppendElement(aafUID_constref value,
     if (FindMember(value) != nullptr) {
         return AAFRESULT_INVALID_PARAM;
     }
+    model()->TellChange();
     members_.push_back({name, value, 0});
     return AAFRESULT_SUCCESS;
 }

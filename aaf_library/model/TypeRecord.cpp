@@ -3,6 +3,7 @@
 #include "aaf_library/model/TypeRecord.h"
 
 #include <algorithm>
+#include <cstring>
 
 #include "aaf_library/model/Model.h"
 #include "aaf_library/model/Text.h"
@@ -65,32 +66,60 @@ HRESULT TypeRecord::Setup(const GUID& id, const std::wstring& name, TypeMembers 
 }
 
 std::size_t TypeRecord::StoredSize() const {
-    return StoredOffset(static_cast<aafUInt32>(members_.size()));
+    return isStoredAsNative_ ? nativeSize_ : StoredOffset(static_cast<aafUInt32>(members_.size()));
 }
 
 void TypeRecord::UseNaturalLayout() {
     std::size_t offset = 0;
-    offsets_.clear();
+    std::vector<std::size_t> offsets;
     for (const TypeDefinition* type : types_) {
         offset = AlignUp(offset, AlignmentOf(*type));
-        offsets_.push_back(offset);
+        offsets.push_back(offset);
         offset += type->NativeSize();
     }
-    nativeSize_ = AlignUp(offset, AlignmentOf(*this));
+    UseOffsets(std::move(offsets), AlignUp(offset, AlignmentOf(*this)));
 }
 
 void TypeRecord::UseLayoutOf(const TypeRecord& other) {
-    offsets_ = other.offsets_;
-    nativeSize_ = other.nativeSize_;
+    UseOffsets(other.offsets_, other.nativeSize_);
+}
+
+void TypeRecord::UseOffsets(std::vector<std::size_t> offsets, std::size_t nativeSize) {
+    offsets_ = std::move(offsets);
+    nativeSize_ = nativeSize;
+    isStoredAsNative_ = AreMembersStoredAsNative();
+}
+
+// Numbers and arrays of them: the layout of any other member may be registered anew.
+bool TypeRecord::AreMembersStoredAsNative() const {
+    std::size_t end = 0;
+    for (std::size_t i = 0; i < offsets_.size(); ++i) {
+        const TypeDefinition& type = *types_[i];
+        const TypeDefinition& number = type.kind() == TypeKind::FixedArray ? *type.element() : type;
+        if (number.kind() != TypeKind::Integer || !number.IsStoredAsNative() ||
+            offsets_[i] != end) {
+            return false;
+        }
+        end += type.StoredSize();
+    }
+    return end != 0 && end == nativeSize_;
 }
 
 void TypeRecord::AppendStored(const std::uint8_t* native, Bytes& out) const {
+    if (isStoredAsNative_) {
+        out.insert(out.end(), native, native + nativeSize_);
+        return;
+    }
     for (std::size_t i = 0; i < members_.size(); ++i) {
         types_[i]->AppendStored(native + offsets_[i], out);
     }
 }
 
 void TypeRecord::CopyNative(const std::uint8_t* stored, std::uint8_t* native) const {
+    if (isStoredAsNative_) {
+        std::memcpy(native, stored, nativeSize_);
+        return;
+    }
     for (std::size_t i = 0; i < members_.size(); ++i) {
         types_[i]->CopyNative(stored, native + offsets_[i]);
         stored += types_[i]->StoredSize();
@@ -193,7 +222,7 @@ HRESULT TypeRecord::CheckStruct(aafUInt32 dataSize) const {
 
 bool TypeRecord::LayoutFits() const {
     // A member's own layout may have been registered anew and grown.
-    for (std::size_t i = 0; i < members_.size(); ++i) {
+    for (std::size_t i = 0; !isStoredAsNative_ && i < members_.size(); ++i) {
         const std::size_t size = types_[i]->NativeSize();
         if (size == 0 || size > nativeSize_ || offsets_[i] > nativeSize_ - size) {
             return false;
@@ -331,8 +360,7 @@ HRESULT TypeRecord::RegisterMembers(aafUInt32* offsets, aafUInt32 numMembers,
             return AAFRESULT_ILLEGAL_VALUE;
         }
     }
-    offsets_.assign(offsets, offsets + numMembers);
-    nativeSize_ = structSize;
+    UseOffsets({offsets, offsets + numMembers}, structSize);
     return AAFRESULT_SUCCESS;
 }
 

@@ -26,6 +26,7 @@ public:
     // Of the members as they are now: a file may say more of an enumeration or a rename.
     std::size_t StoredSize() const override;
     std::size_t NativeSize() const override { return LayoutFits() ? nativeSize_ : 0; }
+    bool IsStoredAsNative() const override { return isStoredAsNative_; }
     void AppendStored(const std::uint8_t* native, Bytes& out) const override;
     void CopyNative(const std::uint8_t* stored, std::uint8_t* native) const override;
 
@@ -54,12 +55,15 @@ private:
     HRESULT CheckStruct(aafUInt32 dataSize) const;
     bool LayoutFits() const;
     HRESULT CheckMember(aafUInt32 index) const;
+    bool AreMembersStoredAsNative() const;
+    void UseOffsets(std::vector<std::size_t> offsets, std::size_t nativeSize);
     std::size_t StoredOffset(aafUInt32 index) const;
 
     TypeMembers members_;
     std::vector<TypeDefinition*> types_;  // of the members
     std::vector<std::size_t> offsets_;    // in the caller's structure
     std::size_t nativeSize_ = 0;          // 0: no layout yet
+    bool isStoredAsNative_ = false;       // numbers alone, one behind the other
 };
 
 }  // namespace aaf

@@ -14,6 +14,7 @@
 namespace aaf {
 
 class Model;
+class Object;
 
 // Root of every object of the library: identity, reference count, and the link
 // to the model that it belongs to.
@@ -33,6 +34,9 @@ public:
 
     // The one pointer that stands for the object; it equals none of its other interfaces.
     IUnknown* Identity() { return this; }
+
+    // Itself, where it is an object with values; else null. Asked far too often for a cast.
+    virtual Object* AsObject() { return nullptr; }
 
     // Null for the few objects that live outside any model, such as enumerators.
     Model* model() const { return model_; }
@@ -97,7 +101,9 @@ Unknown* ImplementationOf(IUnknown* any);
 template <class T, class Interface>
 T* ImplementationAs(Interface* any) {
     Unknown* const object = ImplementationOf(any);
-    if constexpr (std::is_final_v<T>) {
+    if constexpr (std::is_same_v<T, Object>) {
+        return object != nullptr ? object->AsObject() : nullptr;
+    } else if constexpr (std::is_final_v<T>) {
         return object != nullptr && typeid(*object) == typeid(T) ? static_cast<T*>(object)
                                                                  : nullptr;
     } else {

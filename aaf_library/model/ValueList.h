@@ -35,6 +35,11 @@ public:
         if (place != entries_.end() && place->first == pid) {
             return std::exchange(place->second, std::move(value));
         }
+        if (entries_.empty()) {
+            entries_.reserve(kUsual);
+            entries_.emplace_back(pid, std::move(value));
+            return nullptr;
+        }
         entries_.emplace(place, pid, std::move(value));
         return nullptr;
     }
@@ -50,6 +55,8 @@ public:
     }
 
 private:
+    static constexpr std::size_t kUsual = 8;  // most objects have no more
+
     Iterator PlaceOf(PropertyId pid) const {
         return std::lower_bound(begin(), end(), pid, [](const Entry& entry, PropertyId number) {
             return entry.first < number;

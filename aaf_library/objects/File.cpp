@@ -3,7 +3,6 @@
 #include "aaf_library/objects/File.h"
 
 #include "aaf_library/model/Dictionary.h"
-#include "aaf_library/model/ValueWidth.h"
 #include "aaf_library/objects/ContentStorage.h"
 #include "aaf_library/objects/Extensions.h"
 #include "aaf_library/objects/Listeners.h"
@@ -263,11 +262,9 @@ HRESULT File::SaveCopyAs(IAAFFile* destFile) {
     if (const HRESULT result = TakeContent(); result < 0) {
         return result;
     }
-    if (target != this && CanSaveContentAs(*target)) {
-        HRESULT result = CopyExtensions(*model_, *target->model_);
-        if (result < 0 || SaveContentAs(*target, &result)) {
-            return result;
-        }
+    HRESULT result = AAFRESULT_SUCCESS;
+    if (target != this && CanSaveContentAs(*target) && SaveContentAs(*target, &result)) {
+        return result;
     }
     if (OpenStorage() == nullptr || target->OpenStorage() == nullptr) {
         return AAFRESULT_OBJECT_NOT_FOUND;
@@ -275,7 +272,7 @@ HRESULT File::SaveCopyAs(IAAFFile* destFile) {
     if (target == this || target->OpenStorage()->MobCount() > 0) {
         return AAFRESULT_OPERATION_NOT_PERMITTED;
     }
-    const HRESULT result = CopyContentTo(*target);
+    result = CopyContentTo(*target);
     return result < 0 ? result : target->Save();
 }
 
@@ -319,7 +316,7 @@ bool File::CanSaveContentAs(const File& target) const {
     const ContentStorage* const to = target.header_->content();
     return target.access_ == Access::Write && !target.saved_ && !target.isShown_ &&
            from != nullptr && to != nullptr && from->classId() == to->classId() &&
-           from->HoldsMobsAlone() && !HasRedefinedTypes(*model_);
+           from->HoldsMobsAlone() && AreExtensionsCopiedAlike(*model_);
 }
 
 // Writes the target without a copy of what goes into it. False, and nothing is told, where the
@@ -331,8 +328,8 @@ bool File::SaveContentAs(File& target, HRESULT* result) {
     const aafUInt32 own = target.header_->IdentificationCount();
     stored::FileResult saved{stored::FileFailure::NotStorable, {}};
     if (target.header_->AddIdentificationsOf(*header_) >= 0) {
-        saved = stored::SaveModel(*target.model_, *target.header_, target.path_,
-                                  target.SizeOfSectors(), header_->content());
+        saved = stored::SaveModel(*model_, *target.header_, target.path_, target.SizeOfSectors(),
+                                  header_->content());
     }
     if (saved.failure == stored::FileFailure::NotStorable ||
         saved.failure == stored::FileFailure::NoMemory) {
@@ -365,7 +362,10 @@ RefPtr<Header> File::StopAwaiting() {
 // is.
 HRESULT File::TakeContent() {
     if (const RefPtr<Header> source = StopAwaiting()) {
-        taken_ = TakeMobs(*source->content());
+        taken_ = CopyExtensions(*source->model(), *model_);
+        if (taken_ >= 0) {
+            taken_ = TakeMobs(*source->content());
+        }
     }
     return taken_;
 }

@@ -4,6 +4,7 @@
 
 #include "aaf_library/objects/OtherComponents.h"
 #include "aaf_library/objects/Rates.h"
+#include "host_interfaces/aaf/AAFClassIds.h"
 
 namespace aaf {
 
@@ -40,11 +41,11 @@ bool IsConvertible(const aafUID_t& from, const aafUID_t& to) {
 }
 
 bool IsTransition(const Component* component) {
-    return dynamic_cast<const Transition*>(component) != nullptr;
+    return component != nullptr && component->IsKindOf(AUID_AAFTransition);
 }
 
 bool IsEvent(const Component* component) {
-    return dynamic_cast<const Event*>(component) != nullptr;
+    return component != nullptr && component->IsKindOf(AUID_AAFEvent);
 }
 
 aafLength_t LengthOf(const Component& component) {

@@ -8,15 +8,18 @@
 #include "aaf_library/stored/UpperCase.h"
 
 #include <algorithm>
+#include <numeric>
 #include <string_view>
 
 namespace aaf::stored {
 
 namespace {
 
-bool IsInNoName(char16_t unit) {
-    return unit == u'/' || unit == u'\\' || unit == u':' || unit == u'!' || unit == u'\0';
-}
+// Most units are letters, which lie behind these.
+constexpr auto IsInNoName = [](char16_t unit) {
+    return unit <= u'\\' &&
+           (unit == u'/' || unit == u'\\' || unit == u':' || unit == u'!' || unit == u'\0');
+};
 
 void CheckName(const std::u16string& name) {
     if (name.empty() || name.size() > kLongestName ||
@@ -28,6 +31,23 @@ void CheckName(const std::u16string& name) {
 void LeadNowhere(std::uint8_t* entry) {
     for (std::size_t link : {kEntryLeftOffset, kEntryRightOffset, kEntryChildOffset}) {
         PutNumber(entry + link, kNoEntry);
+    }
+}
+
+// Adds distances to the numbers of entries and of sectors in these entries.
+void MoveNumbers(Bytes& entries, std::size_t from, CompoundPlace by) {
+    const auto move = [](std::uint8_t* at, std::uint32_t distance) {
+        const std::uint32_t number = NumberIn(at);
+        PutNumber(at, number > kLastPlainSector ? number : number + distance);
+    };
+    for (std::size_t at = from; at < entries.size(); at += kDirectoryEntrySize) {
+        std::uint8_t* const entry = entries.data() + at;
+        move(entry + kEntryLeftOffset, by.entry);
+        move(entry + kEntryRightOffset, by.entry);
+        move(entry + kEntryChildOffset, by.entry);
+        if (entry[kEntryKindOffset] == static_cast<std::uint8_t>(EntryKind::Stream)) {
+            move(entry + kEntryStartOffset, by.sector);
+        }
     }
 }
 
@@ -45,17 +65,18 @@ int FullLevels(std::size_t count) {
 std::uint32_t CompoundDirectory::Add(std::uint32_t holder, const std::u16string& name,
                                      EntryKind kind) {
     CheckName(name);
-    const auto index = static_cast<std::uint32_t>(bytes_.size() / kDirectoryEntrySize);
+    const std::uint32_t index = Count();
     Place& place = places_.emplace_back();
     place.holder = holder;
-    place.length = name.size();
-    std::transform(name.begin(), name.end(), place.name.begin(), UpperCase);
     place.index = index;
+    place.length = name.size();
 
-    bytes_.resize(bytes_.size() + kDirectoryEntrySize);
-    std::uint8_t* const entry = EntryAt(index);
+    Bytes& own = bytes_.own();
+    own.resize(own.size() + kDirectoryEntrySize);
+    std::uint8_t* const entry = own.data() + own.size() - kDirectoryEntrySize;
     for (std::size_t i = 0; i < name.size(); ++i) {
         PutNumber(entry + 2 * i, name[i]);
+        place.name[i] = UpperCase(name[i]);
     }
     PutNumber(entry + kEntryNameSizeOffset, static_cast<std::uint16_t>(2 * name.size() + 2));
     PutNumber(entry + kEntryKindOffset, static_cast<std::uint8_t>(kind));
@@ -77,31 +98,33 @@ void CompoundDirectory::SetContent(std::uint32_t index, std::uint32_t start, std
 }
 
 void CompoundDirectory::AddLinked(std::uint32_t holder, const std::u16string& name,
-                                  const Bytes& linked, std::uint32_t sectorsBefore) {
+                                  const std::shared_ptr<const Bytes>& linked, CompoundPlace place,
+                                  std::uint32_t sectorsBefore) {
     const std::uint32_t storage = Add(holder, name, EntryKind::Storage);
-    if (linked.size() > bytes_.size()) {
-        // Leaves room for what follows the large part of a file.
-        bytes_.reserve(bytes_.size() + linked.size() * 3 / 2);
-    }
     // Its root becomes this storage, and its other entries stand behind it.
-    bytes_.insert(bytes_.end(), linked.begin() + kDirectoryEntrySize, linked.end());
-    const std::uint8_t* const root = linked.data();
+    const CompoundPlace distance = {storage - place.entry, sectorsBefore - place.sector};
+    const std::uint8_t* const root = linked->data();
     std::copy_n(root + kEntryClassOffset, sizeof(StoredAuid), EntryAt(storage) + kEntryClassOffset);
-    std::copy_n(root + kEntryChildOffset, 4, EntryAt(storage) + kEntryChildOffset);
-    const auto moveBy = [](std::uint8_t* at, std::uint32_t distance) {
-        const std::uint32_t number = NumberIn(at);
-        PutNumber(at, number > kLastPlainSector ? number : number + distance);
-    };
-    for (std::size_t at = storage * kDirectoryEntrySize; at < bytes_.size();
-         at += kDirectoryEntrySize) {
-        std::uint8_t* const entry = bytes_.data() + at;
-        moveBy(entry + kEntryLeftOffset, storage);
-        moveBy(entry + kEntryRightOffset, storage);
-        moveBy(entry + kEntryChildOffset, storage);
-        if (entry[kEntryKindOffset] == static_cast<std::uint8_t>(EntryKind::Stream)) {
-            moveBy(entry + kEntryStartOffset, sectorsBefore);
-        }
+    const std::uint32_t child = NumberIn(root + kEntryChildOffset);
+    PutNumber(EntryAt(storage) + kEntryChildOffset,
+              child > kLastPlainSector ? child : child + distance.entry);
+    if (distance == CompoundPlace{}) {
+        bytes_.Share(linked, kDirectoryEntrySize);
+        return;
     }
+    Bytes& own = bytes_.own();
+    const std::size_t first = own.size();
+    own.insert(own.end(), linked->begin() + kDirectoryEntrySize, linked->end());
+    MoveNumbers(own, first, distance);
+}
+
+std::uint32_t CompoundDirectory::Count() const {
+    return static_cast<std::uint32_t>(bytes_.size() / kDirectoryEntrySize);
+}
+
+Bytes CompoundDirectory::TakeFrom(CompoundPlace place) {
+    MoveNumbers(bytes_.own(), 0, place);
+    return std::move(bytes_.own());
 }
 
 // Readers look a name up in a tree that is red and black, and some walk it by recursion. So it has
@@ -123,9 +146,11 @@ void CompoundDirectory::Link() {
 
 void CompoundDirectory::FillUp(std::size_t pieceSize) {
     const std::size_t used = bytes_.size();
-    bytes_.resize((used + pieceSize - 1) / pieceSize * pieceSize);
-    for (std::size_t at = used; at < bytes_.size(); at += kDirectoryEntrySize) {
-        LeadNowhere(bytes_.data() + at);
+    Bytes& own = bytes_.own();
+    const std::size_t first = own.size();
+    own.resize(first + (used + pieceSize - 1) / pieceSize * pieceSize - used);
+    for (std::size_t at = first; at < own.size(); at += kDirectoryEntrySize) {
+        LeadNowhere(own.data() + at);
     }
 }
 
@@ -142,7 +167,7 @@ int CompoundDirectory::Order(const Place& left, const Place& right) {
 }
 
 std::uint8_t* CompoundDirectory::EntryAt(std::uint32_t index) {
-    return bytes_.data() + index * kDirectoryEntrySize;
+    return bytes_.own().data() + bytes_.PlaceOf(std::size_t{index} * kDirectoryEntrySize);
 }
 
 std::u16string CompoundDirectory::NameOf(std::uint32_t index) {
@@ -156,15 +181,25 @@ std::u16string CompoundDirectory::NameOf(std::uint32_t index) {
     return name;
 }
 
-// All but the root.
+// All but the root, storage by storage.
 CompoundDirectory::Places CompoundDirectory::InOrder() const {
-    Places sorted;
-    sorted.reserve(places_.size());
+    std::vector<std::size_t> ends(Count() + std::size_t{1});
     for (std::size_t i = 1; i < places_.size(); ++i) {
-        sorted.push_back(&places_[i]);
+        ++ends[places_[i].holder + std::size_t{1}];
     }
-    std::sort(sorted.begin(), sorted.end(),
-              [](const Place* left, const Place* right) { return Order(*left, *right) < 0; });
+    std::partial_sum(ends.begin(), ends.end(), ends.begin());
+    Places sorted(places_.size() - 1);
+    for (std::size_t i = 1; i < places_.size(); ++i) {
+        sorted[ends[places_[i].holder]++] = &places_[i];
+    }
+    const auto isBefore = [](const Place* left, const Place* right) {
+        return Order(*left, *right) < 0;
+    };
+    for (auto first = sorted.begin(); first != sorted.end();) {
+        const auto end = sorted.begin() + static_cast<std::ptrdiff_t>(ends[(*first)->holder]);
+        std::sort(first, end, isBefore);
+        first = end;
+    }
     return sorted;
 }
 

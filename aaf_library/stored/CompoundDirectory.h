@@ -3,6 +3,7 @@
 #pragma once
 
 #include "aaf_library/stored/CompoundFileFormat.h"
+#include "aaf_library/stored/Pieces.h"
 #include "aaf_library/stored/StoredTree.h"
 
 #include <array>
@@ -10,6 +11,15 @@
 #include <vector>
 
 namespace aaf::stored {
+
+// Where numbers of entries and of small sectors begin.
+struct CompoundPlace {
+    std::uint32_t entry = 0;
+    std::uint32_t sector = 0;
+};
+inline bool operator==(const CompoundPlace& left, const CompoundPlace& right) {
+    return left.entry == right.entry && left.sector == right.sector;
+}
 
 // The directory of a compound file that is written. An entry is known by its number, the root by 0.
 // Throws StoredError.
@@ -19,10 +29,14 @@ public:
     void SetClass(std::uint32_t index, const StoredAuid& classId);
     void SetContent(std::uint32_t index, std::uint32_t start, std::size_t size);
 
-    // Adds a storage that holds what the root of another directory does, which is linked. Its
-    // streams begin so many small sectors later.
-    void AddLinked(std::uint32_t holder, const std::u16string& name, const Bytes& linked,
+    // Adds a storage that holds what the root of another directory does, which is linked and whose
+    // numbers count from its place. Its streams begin behind so many small sectors.
+    void AddLinked(std::uint32_t holder, const std::u16string& name,
+                   const std::shared_ptr<const Bytes>& linked, CompoundPlace place,
                    std::uint32_t sectorsBefore);
+
+    // The number of the next entry.
+    std::uint32_t Count() const;
 
     // Makes a search tree of the entries of each storage; once, when all are there.
     void Link();
@@ -30,8 +44,11 @@ public:
     // With spare entries until it fills whole pieces of that size.
     void FillUp(std::size_t pieceSize);
 
+    // Instead of a file: numbers count from this place. Nothing in it is shared.
+    Bytes TakeFrom(CompoundPlace place);
+
     // Entry after entry, as they stand in the file.
-    Bytes& bytes() { return bytes_; }
+    PiecedBytes& bytes() { return bytes_; }
 
 private:
     // An entry among those of its storage.
@@ -50,7 +67,7 @@ private:
     void RefuseTwins(const Places& sorted);
     std::uint32_t LinkTree(const Place* const* first, std::size_t count, int blackLevels);
 
-    Bytes bytes_;
+    PiecedBytes bytes_;
     std::vector<Place> places_;
 };
 

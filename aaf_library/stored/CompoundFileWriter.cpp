@@ -35,17 +35,25 @@ void FillUp(Bytes& bytes, std::size_t sectorSize) {
     bytes.resize(CountOf(bytes.size(), sectorSize) * sectorSize);
 }
 
+// Adds a distance to the numbers of sectors from one of them on.
+void MoveLinks(std::vector<std::uint32_t>& table, std::size_t from, std::uint32_t distance) {
+    for (std::size_t at = from; distance != 0 && at < table.size(); ++at) {
+        table[at] = table[at] > kLastPlainSector ? table[at] : table[at] + distance;
+    }
+}
+
 // Puts zeros between pieces, or into one that reaches beyond that place.
-void OpenGap(std::vector<Bytes>& pieces, std::size_t place, std::size_t size) {
+void OpenGap(std::vector<Piece>& pieces, std::size_t place, std::size_t size) {
     for (auto piece = pieces.begin(); piece != pieces.end(); ++piece) {
-        if (place < piece->size()) {
-            const auto at = piece->begin() + static_cast<std::ptrdiff_t>(place);
-            Bytes behind(at, piece->end());
-            piece->resize(place);
-            pieces.insert(piece + 1, {Bytes(size), std::move(behind)});
+        if (place < piece->size) {
+            Piece behind = *piece;
+            behind.data += place;
+            behind.size -= place;
+            piece->size = place;
+            pieces.insert(piece + 1, {Piece(Bytes(size)), std::move(behind)});
             return;
         }
-        place -= piece->size();
+        place -= piece->size;
     }
 }
 
@@ -91,57 +99,66 @@ void CompoundFileWriter::AddStream(Storage holder, const std::u16string& name,
 
 void CompoundFileWriter::AddPart(Storage holder, const std::u16string& name,
                                  const CompoundPart& part) {
-    CheckSize(BytesSoFar() + part.small.size() + part.directory.size());
+    CheckSize(BytesSoFar() + part.small->size() + part.directory->size());
     const auto sectorsBefore = static_cast<std::uint32_t>(smallTable_.size());
-    if (part.small.size() > small_.size()) {
-        // Leaves room for what follows the large part of a file.
-        small_.reserve(small_.size() + part.small.size() * 3 / 2);
-        smallTable_.reserve(smallTable_.size() + part.smallTable.size() * 3 / 2);
+    const bool isInPlace = part.place == CompoundPlace{directory_.Count(), sectorsBefore};
+    directory_.AddLinked(holder, name, part.directory, part.place, sectorsBefore);
+    if (isInPlace) {
+        small_.Share(part.small, 0);
+        // As much room as there is for the streams.
+        smallTable_.reserve(smallTable_.size() + part.smallTable.size() * 5 / 4);
+    } else {
+        Bytes& own = small_.own();
+        own.insert(own.end(), part.small->begin(), part.small->end());
     }
-    directory_.AddLinked(holder, name, part.directory, sectorsBefore);
-    small_.insert(small_.end(), part.small.begin(), part.small.end());
     smallTable_.insert(smallTable_.end(), part.smallTable.begin(), part.smallTable.end());
-    for (std::size_t at = sectorsBefore; at < smallTable_.size(); ++at) {
-        std::uint32_t& next = smallTable_[at];
-        next = next > kLastPlainSector ? next : next + sectorsBefore;
-    }
+    MoveLinks(smallTable_, sectorsBefore, sectorsBefore - part.place.sector);
 }
 
-std::optional<CompoundPart> CompoundFileWriter::FinishPart() {
+std::optional<CompoundPart> CompoundFileWriter::FinishPart(CompoundPlace place) {
     if (!table_.empty()) {
         return std::nullopt;
     }
     directory_.Link();
-    return CompoundPart{std::move(directory_.bytes()), std::move(small_), std::move(smallTable_)};
+    MoveLinks(smallTable_, 0, place.sector);
+    return CompoundPart{std::make_shared<const Bytes>(directory_.TakeFrom(place)),
+                        std::make_shared<const Bytes>(std::move(small_.own())),
+                        std::move(smallTable_), place};
 }
 
 Bytes CompoundFileWriter::Finish() {
     Bytes file;
-    for (const Bytes& piece : FinishPieces()) {
-        file.insert(file.end(), piece.begin(), piece.end());
+    for (const Piece& piece : FinishPieces()) {
+        file.insert(file.end(), piece.data, piece.data + piece.size);
     }
     return file;
 }
 
-std::vector<Bytes> CompoundFileWriter::FinishPieces() {
+std::vector<Piece> CompoundFileWriter::FinishPieces() {
     directory_.Link();
-    if (!small_.empty()) {
+    if (small_.size() != 0) {
         directory_.SetContent(kRoot, NumberSectors(small_.size()), small_.size());
     }
     Bytes smallTable = SmallTable();
     directory_.FillUp(sectorSize_);
-    Bytes& directory = directory_.bytes();
+    PiecedBytes& directory = directory_.bytes();
     SetHeader(kFirstDirectoryOffset, NumberSectors(directory.size()));
     SetHeader(kDirectoryCountOffset, large_ ? directory.size() / sectorSize_ : 0);
     Bytes table = Table();
-    FillUp(small_, sectorSize_);
-    for (Bytes* const piece : {&small_, &smallTable, &directory, &table}) {
-        pieces_.push_back(std::move(*piece));
+    small_.own().resize(small_.own().size() + CountOf(small_.size(), sectorSize_) * sectorSize_ -
+                        small_.size());
+    std::vector<Piece> pieces;
+    for (Bytes& piece : pieces_) {
+        pieces.emplace_back(std::move(piece));
     }
+    small_.MoveTo(pieces);
+    pieces.emplace_back(std::move(smallTable));
+    directory.MoveTo(pieces);
+    pieces.emplace_back(std::move(table));
     if (lockSector_ != kFreeSector) {
-        OpenGap(pieces_, (lockSector_ + std::size_t{1}) * sectorSize_, sectorSize_);
+        OpenGap(pieces, (lockSector_ + std::size_t{1}) * sectorSize_, sectorSize_);
     }
-    return std::move(pieces_);
+    return pieces;
 }
 
 void CompoundFileWriter::SetHeader(std::size_t offset, std::size_t value) {
@@ -215,8 +232,10 @@ std::uint32_t CompoundFileWriter::AppendSmallSectors(const Bytes& content) {
         smallTable_.push_back(next);
     }
     smallTable_.push_back(kEndOfChain);
-    small_.insert(small_.end(), content.begin(), content.end());
-    small_.resize(smallTable_.size() * kSmallSectorSize);
+    Bytes& own = small_.own();
+    own.insert(own.end(), content.begin(), content.end());
+    own.resize(own.size() + CountOf(content.size(), kSmallSectorSize) * kSmallSectorSize -
+               content.size());
     return first;
 }
 

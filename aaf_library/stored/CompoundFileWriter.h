@@ -4,20 +4,24 @@
 
 #include "aaf_library/stored/CompoundDirectory.h"
 #include "aaf_library/stored/CompoundFileFormat.h"
+#include "aaf_library/stored/Pieces.h"
 #include "aaf_library/stored/StoredTree.h"
 
+#include <memory>
 #include <optional>
 #include <string>
 #include <vector>
 
 namespace aaf::stored {
 
-// A storage with all that it contains, short streams alone, to be put into any file. Its entries
-// and sectors count from nought.
+// A storage with all that it contains, short streams alone, to be put into any file.
 struct CompoundPart {
-    Bytes directory;
-    Bytes small;
+    std::shared_ptr<const Bytes> directory;
+    std::shared_ptr<const Bytes> small;
     std::vector<std::uint32_t> smallTable;
+    // Its entries and sectors count from here. In that place files refer to its bytes; elsewhere
+    // they hold a copy with other numbers.
+    CompoundPlace place;
 };
 
 // Lays a compound file out in memory. Its sectors come in this order: long
@@ -37,15 +41,15 @@ public:
     Storage AddStorage(Storage holder, const std::u16string& name);
     void AddStream(Storage holder, const std::u16string& name, const Bytes& content);
 
-    // A copy of the part, under a name of its own.
+    // With all that the part contains, under a name of its own.
     void AddPart(Storage holder, const std::u16string& name, const CompoundPart& part);
 
     // Gives the whole file, signature included; once. In pieces, which follow each other, nothing
     // of it is copied once more.
     Bytes Finish();
-    std::vector<Bytes> FinishPieces();
+    std::vector<Piece> FinishPieces();
     // Or the root as a part; none when it holds a long stream.
-    std::optional<CompoundPart> FinishPart();
+    std::optional<CompoundPart> FinishPart(CompoundPlace place = {});
 
 private:
     void SetHeader(std::size_t offset, std::size_t value);
@@ -64,7 +68,7 @@ private:
     const bool large_;
     std::vector<Bytes> pieces_;         // the header, then the long streams
     std::vector<std::uint32_t> table_;  // the sector after each sector
-    Bytes small_;                       // the short streams
+    PiecedBytes small_;                 // the short streams
     std::vector<std::uint32_t> smallTable_;
     CompoundDirectory directory_;
 };

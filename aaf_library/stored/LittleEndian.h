@@ -6,6 +6,7 @@
 #include "aaf_library/stored/StoredTree.h"
 
 #include <cstddef>
+#include <cstring>
 #include <string>
 #include <utility>
 
@@ -13,8 +14,12 @@ namespace aaf::stored {
 
 template <typename Number>
 void PutNumber(std::uint8_t* at, Number value) {
-    for (std::size_t i = 0; i < sizeof(Number); ++i) {
-        at[i] = static_cast<std::uint8_t>(static_cast<std::uint64_t>(value) >> 8 * i);
+    if constexpr (__BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__) {
+        std::memcpy(at, &value, sizeof(Number));
+    } else {
+        for (std::size_t i = 0; i < sizeof(Number); ++i) {
+            at[i] = static_cast<std::uint8_t>(static_cast<std::uint64_t>(value) >> 8 * i);
+        }
     }
 }
 
@@ -30,7 +35,9 @@ public:
 
     template <typename Number>
     ByteWriter& AppendNumber(Number value) {
-        PutNumber(AppendRoom(sizeof(Number)), value);
+        std::uint8_t bytes[sizeof(Number)];
+        PutNumber(bytes, value);
+        bytes_.insert(bytes_.end(), bytes, bytes + sizeof(Number));
         return *this;
     }
     template <typename Range>

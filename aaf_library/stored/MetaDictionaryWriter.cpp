@@ -203,7 +203,7 @@ public:
         std::call_once(place.once, [&] {
             place.object = makeWhole_(entry);
             if (auto laidOut = LayOut(place.object, {kClassPath, kTypePath})) {
-                place.object.properties.resize(1);  // the key in the set of definitions
+                place.object.properties.clear();
                 place.object.laidOut = std::move(laidOut);
             }
         });
@@ -257,6 +257,9 @@ StoredObject MetaDictionaryOf(const MetaRecords& records,
     return dictionary;
 }
 
+// Where it stands in a file: behind the root, the root's values and its own entry.
+constexpr CompoundPlace kPlaceOfMetaDictionary = {2, 2};
+
 // Movies of one kind need the same definitions, so the dictionaries that were used last
 // are kept as a whole.
 class KeptDictionaries {
@@ -295,9 +298,11 @@ StoredObject StoredMetaDictionary(const MetaRecords& records) {
     return MetaDictionaryOf(records, StoredBuiltInClass, StoredBuiltInType);
 }
 
-StoredObject StoredDataDefinition(const BuiltInDefinition& entry) {
+namespace {
+
+StoredObject StoredDefinition(const GUID& classId, const BuiltInDefinition& entry) {
     StoredObject object;
-    object.classId = AuidOf(AUID_AAFDataDefinition);
+    object.classId = AuidOf(classId);
     const auto add = [&](const PropertyKey& key, Bytes value) {
         StoredProperty property;
         property.pid = key.pid;
@@ -313,8 +318,24 @@ StoredObject StoredDataDefinition(const BuiltInDefinition& entry) {
     return object;
 }
 
+}  // namespace
+
+StoredObject StoredDataDefinition(const BuiltInDefinition& entry) {
+    return StoredDefinition(AUID_AAFDataDefinition, entry);
+}
+
+StoredObject StoredContainerDefinition(const BuiltInDefinition& entry) {
+    return StoredDefinition(AUID_AAFContainerDefinition, entry);
+}
+
 StoredObject LaidOutDataDefinition(const BuiltInDefinition& entry) {
     static LaidOutTable<BuiltInDefinition> table(BuiltInDataDefinitions(), StoredDataDefinition);
+    return table.Definition(entry);
+}
+
+StoredObject LaidOutContainerDefinition(const BuiltInDefinition& entry) {
+    static LaidOutTable<BuiltInDefinition> table(BuiltInContainerDefinitions(),
+                                                 StoredContainerDefinition);
     return table.Definition(entry);
 }
 
@@ -325,7 +346,7 @@ StoredObject LaidOutMetaDictionary(const MetaRecords& records) {
     }
     StoredObject dictionary = MetaDictionaryOf(records, LaidOutClass, LaidOutType);
     try {
-        if (auto laidOut = LayOut(dictionary, {kClassPath, kTypePath})) {
+        if (auto laidOut = LayOut(dictionary, {kClassPath, kTypePath}, kPlaceOfMetaDictionary)) {
             dictionary.properties.clear();
             dictionary.laidOut = std::move(laidOut);
             kept.Keep(records, dictionary);

@@ -50,9 +50,12 @@ StoredObject StoredMetaDictionary(const MetaRecords& records);
 // The same for writing alone: what files have in common is laid out once.
 StoredObject LaidOutMetaDictionary(const MetaRecords& records);
 
-// A definition of data as the built-in model has it; the second is for writing alone.
+// Definitions of data and of containers as the built-in model has them.
 StoredObject StoredDataDefinition(const BuiltInDefinition& entry);
+StoredObject StoredContainerDefinition(const BuiltInDefinition& entry);
+// The same for writing alone.
 StoredObject LaidOutDataDefinition(const BuiltInDefinition& entry);
+StoredObject LaidOutContainerDefinition(const BuiltInDefinition& entry);
 
 // Definitions of a kind that nobody knows are passed over, those that make no sense are left out
 // and noted. Throws StoredError when there is no set of classes or of types.

@@ -15,8 +15,8 @@ class Object;
 namespace aaf::stored {
 
 // Writes the header with all that it contains, the model's dictionary and the
-// definitions that these need. See ModelWriter.h for what is added, and for the content, and
-// StoredFile.h for how the file is replaced.
+// definitions that these need. See ModelWriter.h for what is added, and for the content, which
+// makes it a copy of the model's, and StoredFile.h for how the file is replaced.
 FileResult SaveModel(Model& model, Object& header, const std::filesystem::path& path,
                      SectorSize sectorSize, const Object* content = nullptr);
 

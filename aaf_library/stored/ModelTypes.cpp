@@ -11,6 +11,8 @@ namespace {
 // A property value has a size field of 16 bits.
 constexpr std::uint64_t kLargestValue = 0xFFFF;
 
+}  // namespace
+
 bool IsStorable(const TypeFacts& record, Model& model) {
     const TypeDefinition* target = model.FindType(record.target);
     switch (record.kind) {
@@ -38,8 +40,6 @@ bool IsStorable(const TypeFacts& record, Model& model) {
             return true;
     }
 }
-
-}  // namespace
 
 RefPtr<TypeDefinition> StorableType(const TypeFacts& record, Model& model) {
     return IsStorable(record, model) ? MakeType(model, record) : nullptr;

@@ -15,9 +15,12 @@ namespace aaf::stored {
 // Pids from here on mean something else in every file.
 inline constexpr std::uint16_t kFirstLocalPid = 0x8000;
 
+// Whether the record makes sense: there is no integer of 3 bytes, for one, nor a value that is
+// larger than any that can be stored.
+bool IsStorable(const TypeFacts& record, Model& model);
+
 // A free type made of the record. Everything that it refers to must be in the
-// model. Null when the record makes no sense, such as an integer of 3 bytes or
-// a value that is larger than any that can be stored.
+// model. Null unless the record is storable.
 RefPtr<TypeDefinition> StorableType(const TypeFacts& record, Model& model);
 
 }  // namespace aaf::stored

@@ -27,15 +27,17 @@ namespace aaf::stored {
 namespace {
 
 using Path = std::vector<std::uint16_t>;
+using Targets = std::set<Bytes>;
 
 constexpr std::size_t kIdSize = sizeof(StoredAuid);
 
-bool IsBuiltInContainer(const Bytes& id) {
+// Null when it is not among them.
+const BuiltInDefinition* FindIn(Span<BuiltInDefinition> table, const Bytes& id) {
     const GUID wanted = GuidOf(id);
-    const Span<BuiltInDefinition> table = BuiltInContainerDefinitions();
-    return std::any_of(table.begin(), table.end(), [&](const BuiltInDefinition& definition) {
-        return definition.id == wanted;
-    });
+    const auto* const found =
+        std::find_if(table.begin(), table.end(),
+                     [&](const BuiltInDefinition& definition) { return definition.id == wanted; });
+    return found == table.end() ? nullptr : found;
 }
 
 bool IsWeak(StoredForm form) {
@@ -58,15 +60,21 @@ public:
     struct Common {
         StoredObject (*metaDictionary)(const MetaRecords&);
         StoredObject (*dataDefinition)(const BuiltInDefinition&);
+        StoredObject (*containerDefinition)(const BuiltInDefinition&);
     };
 
-    ModelWriter(Model& model, Common common) : model_(model), closure_(model), common_(common) {}
+    // The content, unless null, stands in place of the header's own, which is another file's then.
+    ModelWriter(Model& model, Object& header, const Object* content, Common common)
+        : model_(model),
+          header_(header),
+          content_(content),
+          replaced_(content == nullptr ? nullptr : header.ObjectAt(prop::Header_Content)),
+          numbers_(content == nullptr ? AllottedNumbers() : model.NumbersInACopy()),
+          closure_(model, MetaClosure::BuiltIn::Gathered, numbers_),
+          common_(common) {}
 
-    // The content stands in place of the header's own; it may be of another model.
-    StoredObject Write(Object& header, const Object* content) {
-        replaced_ = content == nullptr ? nullptr : header.ObjectAt(prop::Header_Content);
-        content_ = content;
-        StoredObject storedHeader = StoredObjectOf(header, prop::Header_Dictionary.pid);
+    StoredObject Write() {
+        StoredObject storedHeader = StoredObjectOf(header_, prop::Header_Dictionary.pid);
         storedHeader.properties.push_back(ReferenceTo(prop::Header_Dictionary.pid, u"Dictionary",
                                                       StoredDictionary(model_.dictionary())));
         SortByPid(storedHeader);
@@ -91,7 +99,7 @@ private:
         bool carriesType;
         bool isSetOfParameters;
         bool namesParameter;
-        std::set<Bytes>* targets = nullptr;  // weak forms: what references to that set lead to
+        Targets* targets = nullptr;  // weak forms: what references to that set lead to
     };
     // What all objects of a class have in common.
     struct ClassFacts {
@@ -119,7 +127,7 @@ private:
         out.properties.reserve(from.values().size() + 2);
         for (const auto& entry : from.values()) {
             if (entry.first != leftOut && entry.first != prop::InterchangeObject_ObjClass.pid) {
-                out.properties.push_back(StoredPropertyOf(facts, from, entry.first, *entry.second));
+                AddProperty(out, facts, from, entry.first, *entry.second);
             }
         }
         AddRequired(facts, out, leftOut);
@@ -127,26 +135,15 @@ private:
         return out;
     }
 
-    // Whether a definition of any model tells what the model to be written would say: then nothing
-    // has to be made there.
-    static bool Says(const ClassDefinition& definition, const Model& model) {
-        if (definition.model() == &model) {
-            return true;
-        }
-        const ClassDefinition* at = &definition;
-        while (at != nullptr && at->IsAsBuiltIn()) {
-            at = at->parent();
-        }
-        return at == nullptr;
-    }
-
     ClassFacts& FactsOfClass(const Object& from) {
         const auto [place, isNew] = classes_.try_emplace(&from.classDefinition());
         ClassFacts& facts = place->second;
         if (isNew) {
-            facts.definition = Says(from.classDefinition(), model_)
-                                   ? &from.classDefinition()
-                                   : model_.ClassLike(from.classDefinition());
+            facts.definition = from.model() == &model_ ? &from.classDefinition()
+                                                       : model_.FindClass(from.classId());
+            if (facts.definition == nullptr) {
+                throw StoredError("an object of another file is of a class that is unknown here");
+            }
             facts.id = AuidOf(from.classId());
             closure_.AddClass(from.classId());
             facts.required = RequiredObjects(*facts.definition);
@@ -154,13 +151,13 @@ private:
         return facts;
     }
 
-    const PropertyFacts& FactsOfProperty(ClassFacts& facts, const Object& from, PropertyId pid) {
+    const PropertyFacts& FactsOfProperty(ClassFacts& facts, PropertyId pid) {
         for (const PropertyFacts& known : facts.properties) {
             if (known.from == pid) {
                 return known;
             }
         }
-        const PropertyDefinition& definition = DefinitionOf(facts, from, pid);
+        const PropertyDefinition& definition = DefinitionOf(facts, pid);
         const TypeKind kind = definition.type()->Resolved().kind();
         PropertyFacts& made = facts.properties.emplace_back(
             PropertyFacts{pid, &definition, EmptyProperty(definition),
@@ -173,35 +170,34 @@ private:
         return made;
     }
 
-    const PropertyDefinition& DefinitionOf(const ClassFacts& facts, const Object& from,
-                                           PropertyId pid) {
-        const PropertyDefinition* definition = from.classDefinition().FindProperty(pid);
-        const bool isHere = facts.definition == &from.classDefinition() && pid < kFirstLocalPid;
-        if (definition != nullptr && from.model() != &model_ && !isHere) {
-            definition =
-                model_.PropertyLike(*model_.ClassLike(from.classDefinition()), *definition);
-        }
+    static const PropertyDefinition& DefinitionOf(const ClassFacts& facts, PropertyId pid) {
+        const PropertyDefinition* const definition = facts.definition->FindProperty(pid);
         if (definition == nullptr || definition->type() == nullptr) {
             throw StoredError(PropertyText(pid) + " has no definition");
         }
         return *definition;
     }
 
-    StoredProperty StoredPropertyOf(ClassFacts& facts, const Object& from, PropertyId pid,
-                                    const PropertyValue& value) {
-        return value.asStored() ? AsItStands(DefinitionOf(facts, from, pid), value)
-                                : StoredPropertyOf(FactsOfProperty(facts, from, pid), value);
+    void AddProperty(StoredObject& out, ClassFacts& facts, const Object& from, PropertyId pid,
+                     const PropertyValue& value) {
+        if (from.model() != &model_ && (pid >= kFirstLocalPid || value.asStored())) {
+            throw StoredError(PropertyText(pid) + " says what only its own file knows");
+        }
+        if (value.asStored()) {
+            out.properties.push_back(AsItStands(DefinitionOf(facts, pid), value));
+        } else {
+            AddValue(out, FactsOfProperty(facts, pid), value);
+        }
     }
 
     // What a file held in place of a value, with the numbers that this one has.
     StoredProperty AsItStands(const PropertyDefinition& definition, const PropertyValue& value) {
         const auto& kept = static_cast<const KeptProperty&>(*value.asStored());
-        TakeAlong(value);
         for (const auto& [set, id] : kept.targets) {
             keptTargets_.emplace(set, AuidOf(id));
         }
         StoredProperty out = kept.property;
-        out.pid = definition.pid();
+        out.pid = NumberOf(definition);
         if (!out.name.empty()) {
             out.name = Utf16Of(definition.name());
         } else if (!out.bytes.empty()) {
@@ -241,7 +237,7 @@ private:
         for (StoredProperty& property : object.properties) {
             if (const auto local = numbers.find(property.pid); local != numbers.end()) {
                 const PropertyDefinition* const definition = model_.FindProperty(local->second);
-                property.pid = definition == nullptr ? kNoPropertyId : definition->pid();
+                property.pid = definition == nullptr ? kNoPropertyId : NumberOf(*definition);
             }
             if (property.pid != kNoPropertyId) {
                 known.push_back(std::move(property));
@@ -250,31 +246,28 @@ private:
         object.properties = std::move(known);
     }
 
-    StoredProperty StoredPropertyOf(const PropertyFacts& facts, const PropertyValue& value) {
+    void AddValue(StoredObject& out, const PropertyFacts& facts, const PropertyValue& value) {
         const TypeDefinition& type = *facts.definition->type();
-        if (value.model() != &model_ && value.type().id() != type.id()) {
+        if (IsCopy() && value.type().id() != type.id()) {
             throw StoredError(TextOf(*facts.definition) + " holds a value of a type of its own");
         }
         if (&value.type() != &type && StoredFormOf(value.type()) != facts.empty.form) {
             throw StoredError(TextOf(*facts.definition) +
                               " holds a value of another form than its type");
         }
-        StoredProperty out = facts.empty;
+        out.properties.push_back(facts.empty);
         try {
-            Fill(out, facts, value);
+            Fill(out.properties.back(), facts, value);
         } catch (const StoredError& problem) {
             throw StoredError(TextOf(*facts.definition) + ": " + problem.what());
         }
-        return out;
     }
 
     void Fill(StoredProperty& out, const PropertyFacts& facts, const PropertyValue& value) {
         switch (out.form) {
             case StoredForm::Data:
                 NoteCarriedType(facts, value);
-                if (facts.namesParameter && value.model() != &model_) {
-                    model_.CopyParameterNamedBy(value);
-                }
+                NoteParameter(facts, value);
                 out.bytes = value.bytes();
                 break;
             case StoredForm::Stream:
@@ -322,7 +315,7 @@ private:
     // A property of the right form and name that holds nothing yet.
     StoredProperty EmptyProperty(const PropertyDefinition& definition) {
         StoredProperty out;
-        out.pid = definition.pid();
+        out.pid = NumberOf(definition);
         out.form = StoredFormOf(*definition.type());
         if (out.form != StoredForm::Data && out.form != StoredForm::WeakReference) {
             out.name = Utf16Of(definition.name());
@@ -330,7 +323,7 @@ private:
         if (out.form == StoredForm::StrongSet) {
             const TypeFacts target = FactsOf(ReferenceIn(*definition.type()));
             const PropertyDefinition* key = KeyOf(target.target);
-            out.keyPid = key->pid();
+            out.keyPid = NumberOf(*key);
             out.keySize = static_cast<std::uint8_t>(key->type()->StoredSize());
         }
         return out;
@@ -352,7 +345,7 @@ private:
             facts.empty.targetPath.push_back(PidOf(step.id));
         }
         try {
-            facts.empty.keyPid = KeyOf(reference.target)->pid();
+            facts.empty.keyPid = NumberOf(*KeyOf(reference.target));
         } catch (const StoredError& problem) {
             throw StoredError(TextOf(*facts.definition) + ": " + problem.what());
         }
@@ -366,16 +359,8 @@ private:
             const auto from = ids.begin() + static_cast<std::ptrdiff_t>(at);
             out.keys.emplace_back(from, from + kIdSize);
             if (facts.targets->insert(out.keys.back()).second) {
-                TakeAlong(value);
                 NoteMetaTarget(out.targetPath, GuidOf(out.keys.back()));
             }
-        }
-    }
-
-    // What a value of another model refers to has to be in this one.
-    void TakeAlong(const PropertyValue& value) {
-        if (value.model() != &model_) {
-            model_.CopyReferredTo(value);
         }
     }
 
@@ -387,7 +372,7 @@ private:
             return meta::kRootHeader;
         }
         if (const PropertyDefinition* known = model_.FindProperty(property)) {
-            return known->pid();
+            return NumberOf(*known);
         }
         const BuiltInProperty* builtIn = FindBuiltInProperty(property);
         return builtIn == nullptr ? kNoPropertyId : builtIn->key.pid;
@@ -408,7 +393,6 @@ private:
         if (!facts.carriesType || bytes.size() <= kIdSize) {
             return;
         }
-        TakeAlong(value);
         StoredAuid id;
         std::copy_n(bytes.begin() + 1, kIdSize, id.begin());
         if (model_.FindType(GuidOf(id)) != nullptr) {
@@ -416,11 +400,19 @@ private:
         }
     }
 
+    // A parameter names its definition by a plain id, so a copy would do without.
+    void NoteParameter(const PropertyFacts& facts, const PropertyValue& value) {
+        if (facts.namesParameter && IsCopy() && value.bytes().size() == kIdSize) {
+            keptTargets_.emplace(prop::Dictionary_ParameterDefinitions.pid,
+                                 AuidOf(GuidOf(value.bytes())));
+        }
+    }
+
     // Readers want the collections that a class requires, and an (empty) set
     // of essence data; an object that is required and absent stops them.
     void AddRequired(const ClassFacts& facts, StoredObject& out, PropertyId leftOut) {
         for (const PropertyDefinition* definition : facts.required) {
-            if (definition->pid() == leftOut || out.Find(definition->pid()) != nullptr) {
+            if (definition->pid() == leftOut || out.Find(NumberOf(*definition)) != nullptr) {
                 continue;
             }
             StoredProperty empty = EmptyProperty(*definition);
@@ -446,6 +438,15 @@ private:
         return out;
     }
 
+    // Into a copy of the content goes no more than it needs.
+    bool IsCopy() const { return content_ != nullptr; }
+
+    // The number that the file gives to a property.
+    PropertyId NumberOf(const PropertyDefinition& definition) const {
+        const auto number = numbers_.find(definition.pid());
+        return number == numbers_.end() ? definition.pid() : number->second;
+    }
+
     // Of the definitions that every model has from the start all of data are
     // stored, of others only those that something refers to. A definition may
     // refer to others, so the sets are gone through until nothing is added.
@@ -454,8 +455,8 @@ private:
         ClassFacts& facts = FactsOfClass(from);
         out.classId = facts.id;
         for (const auto& [pid, value] : from.MadeValues()) {
-            if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
-                out.properties.push_back(StoredPropertyOf(facts, from, pid, *value));
+            if (!IsCopy() && StoredFormOf(value->type()) != StoredForm::StrongSet) {
+                AddProperty(out, facts, from, pid, *value);
             }
         }
         std::map<PropertyId, StoredProperty> sets;
@@ -465,17 +466,14 @@ private:
             before = stored.size();
             MakeTargets(from);
             for (const auto& [pid, value] : from.MadeValues()) {
-                if (StoredFormOf(value->type()) != StoredForm::StrongSet) {
+                if (StoredFormOf(value->type()) != StoredForm::StrongSet ||
+                    (IsCopy() && !Dictionary::IsSetOfDefinitions(pid))) {
                     continue;
                 }
-                const auto [set, isNew] = sets.try_emplace(pid);
-                if (isNew) {
-                    set->second = EmptyProperty(*from.classDefinition().FindProperty(pid));
-                }
-                AddDefinitions(set->second, value->objects(), stored);
+                AddDefinitions(SetIn(sets, from, pid), value->objects(), stored);
             }
         } while (stored.size() != before);
-        AddDataDefinitions(from, sets);
+        AddBuiltIn(from, sets);
         for (auto& set : sets) {
             if (!set.second.objects.empty()) {
                 out.properties.push_back(std::move(set.second));
@@ -496,7 +494,7 @@ private:
             }
         }
         for (const auto& [path, keys] : targets_) {
-            if (IsWithinDictionary(path)) {
+            if (!IsCopy() && IsWithinDictionary(path)) {
                 for (const Bytes& key : keys) {
                     dictionary.FindDefinition(path[2], GuidOf(key));
                 }
@@ -510,38 +508,78 @@ private:
 
     void AddDefinitions(StoredProperty& set, const std::vector<RefPtr<Object>>& definitions,
                         std::set<const Object*>& stored) {
-        const Path path = {meta::kRootHeader, prop::Header_Dictionary.pid, set.pid};
+        const Targets* const targets = TargetsIn(set.pid);
         for (const RefPtr<Object>& definition : definitions) {
             const Bytes key = definition->UniqueKey();
-            const bool wanted = set.pid != prop::Dictionary_ContainerDefinitions.pid ||
-                                !IsBuiltInContainer(key) || targets_[path].count(key) != 0;
-            if (wanted && stored.insert(definition.get()).second) {
+            const bool isTarget = targets != nullptr && targets->count(key) != 0;
+            if (IsWanted(set.pid, key, isTarget) && stored.insert(definition.get()).second) {
                 set.keys.push_back(key);
                 set.objects.push_back(StoredObjectOf(*definition));
             }
         }
     }
 
-    // Programs that extend a file look for all of them. Those that nobody looked up say what the
-    // built-in model says.
-    void AddDataDefinitions(const Dictionary& from, std::map<PropertyId, StoredProperty>& sets) {
-        const PropertyKey& key = prop::Dictionary_DataDefinitions;
-        const auto [place, isNew] = sets.try_emplace(key.pid);
-        StoredProperty& set = place->second;
-        if (isNew) {
-            set = EmptyProperty(*from.classDefinition().FindProperty(key.pid));
+    // A copy has the built-in definitions as every new file has them, whatever a caller made of
+    // those here.
+    bool IsWanted(PropertyId set, const Bytes& key, bool isTarget) const {
+        const bool isContainer = set == prop::Dictionary_ContainerDefinitions.pid &&
+                                 FindIn(BuiltInContainerDefinitions(), key) != nullptr;
+        if (!IsCopy()) {
+            return isTarget || !isContainer;
         }
-        set.keys.reserve(set.keys.size() + BuiltInDataDefinitions().size());
-        set.objects.reserve(set.objects.size() + BuiltInDataDefinitions().size());
+        const bool isData = set == prop::Dictionary_DataDefinitions.pid &&
+                            FindIn(BuiltInDataDefinitions(), key) != nullptr;
+        return isTarget && !isContainer && !isData;
+    }
+
+    // Null when there are none.
+    const Targets* TargetsIn(PropertyId set) const {
+        const auto found = targets_.find({meta::kRootHeader, prop::Header_Dictionary.pid, set});
+        return found == targets_.end() ? nullptr : &found->second;
+    }
+
+    // Those that are not there yet. Programs that extend a file look for all definitions of data.
+    void AddBuiltIn(const Dictionary& from, std::map<PropertyId, StoredProperty>& sets) {
+        StoredProperty& data = SetIn(sets, from, prop::Dictionary_DataDefinitions.pid);
+        data.keys.reserve(data.keys.size() + BuiltInDataDefinitions().size());
+        data.objects.reserve(data.objects.size() + BuiltInDataDefinitions().size());
         closure_.AddClass(AUID_AAFDataDefinition);
         for (const BuiltInDefinition& entry : BuiltInDataDefinitions()) {
-            const StoredAuid id = AuidOf(entry.id);
-            const Bytes bytes(id.begin(), id.end());
-            if (std::find(set.keys.begin(), set.keys.end(), bytes) == set.keys.end()) {
-                set.keys.push_back(bytes);
-                set.objects.push_back(common_.dataDefinition(entry));
+            AddBuiltIn(data, entry, common_.dataDefinition);
+        }
+        const Targets* const containers = TargetsIn(prop::Dictionary_ContainerDefinitions.pid);
+        if (containers == nullptr) {
+            return;
+        }
+        for (const Bytes& key : *containers) {
+            const BuiltInDefinition* const entry = FindIn(BuiltInContainerDefinitions(), key);
+            if (entry != nullptr) {
+                closure_.AddClass(AUID_AAFContainerDefinition);
+                AddBuiltIn(SetIn(sets, from, prop::Dictionary_ContainerDefinitions.pid), *entry,
+                           common_.containerDefinition);
             }
         }
+    }
+
+    static void AddBuiltIn(StoredProperty& set, const BuiltInDefinition& entry,
+                           StoredObject (*stored)(const BuiltInDefinition&)) {
+        const StoredAuid id = AuidOf(entry.id);
+        const auto isKey = [&id](const Bytes& key) {
+            return std::equal(key.begin(), key.end(), id.begin(), id.end());
+        };
+        if (std::none_of(set.keys.begin(), set.keys.end(), isKey)) {
+            set.keys.emplace_back(id.begin(), id.end());
+            set.objects.push_back(stored(entry));
+        }
+    }
+
+    StoredProperty& SetIn(std::map<PropertyId, StoredProperty>& sets, const Dictionary& from,
+                          PropertyId pid) {
+        const auto [place, isNew] = sets.try_emplace(pid);
+        if (isNew) {
+            place->second = EmptyProperty(*from.classDefinition().FindProperty(pid));
+        }
+        return place->second;
     }
 
     // Readers fail when a target is not where the reference says it is.
@@ -568,11 +606,13 @@ private:
     }
 
     Model& model_;
+    const Object& header_;
+    const Object* const content_;
+    const Object* const replaced_;
+    const AllottedNumbers numbers_;
     MetaClosure closure_;
     const Common common_;
-    const Object* replaced_ = nullptr;
-    const Object* content_ = nullptr;
-    std::map<Path, std::set<Bytes>> targets_;  // what weak references lead to
+    std::map<Path, Targets> targets_;  // what weak references lead to
     // The same for what is written as it stands. These may lead to nothing.
     std::set<std::pair<PropertyId, StoredAuid>> keptTargets_;
     std::unordered_map<const ClassDefinition*, ClassFacts> classes_;
@@ -581,12 +621,15 @@ private:
 }  // namespace
 
 StoredObject TreeOfModel(Model& model, Object& header) {
-    return ModelWriter(model, {StoredMetaDictionary, StoredDataDefinition}).Write(header, nullptr);
+    return ModelWriter(model, header, nullptr,
+                       {StoredMetaDictionary, StoredDataDefinition, StoredContainerDefinition})
+        .Write();
 }
 
 StoredObject TreeToWrite(Model& model, Object& header, const Object* content) {
-    return ModelWriter(model, {LaidOutMetaDictionary, LaidOutDataDefinition})
-        .Write(header, content);
+    return ModelWriter(model, header, content,
+                       {LaidOutMetaDictionary, LaidOutDataDefinition, LaidOutContainerDefinition})
+        .Write();
 }
 
 }  // namespace aaf::stored

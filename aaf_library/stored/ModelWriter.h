@@ -19,8 +19,9 @@ namespace aaf::stored {
 // such as a slot its segment.
 StoredObject TreeOfModel(Model& model, Object& header);
 // The same for WriteTree alone: definitions that files have in common are there as they are laid
-// out, not as properties. The content, unless null, stands in place of the header's own. It may be
-// of another model: what it needs of definitions is registered with this one.
+// out, not as properties. A content of this model, unless null, stands in place of the header's
+// own, and the header is that of a new file: then the tree is what that file would hold had it
+// taken a copy of the content, with the definitions that it needs and all extensions.
 StoredObject TreeToWrite(Model& model, Object& header, const Object* content = nullptr);
 
 }  // namespace aaf::stored

@@ -57,7 +57,7 @@ public:
         }
     }
 
-    bool Write(const std::vector<Bytes>& pieces) {
+    bool Write(const std::vector<Piece>& pieces) {
         exists_ = true;
         return WritePieces(path_, pieces);
     }
@@ -74,7 +74,7 @@ private:
     bool exists_ = false;
 };
 
-FileResult ReplaceFile(const std::vector<Bytes>& pieces, const std::filesystem::path& path) {
+FileResult ReplaceFile(const std::vector<Piece>& pieces, const std::filesystem::path& path) {
     TemporaryFile temporary(path);
     if (!temporary.Write(pieces)) {
         return SystemFailure(path, "cannot be written");

@@ -45,8 +45,7 @@ struct StoredObject {
     std::vector<StoredProperty> properties;
 
     // What is written for the object where it was laid out before (LayOut in
-    // TreeWriter.h); then only the key of a set is looked for among the
-    // properties.
+    // TreeWriter.h); then nobody looks at the properties.
     std::shared_ptr<const LaidOut> laidOut;
 
     const StoredProperty* Find(std::uint16_t pid) const;

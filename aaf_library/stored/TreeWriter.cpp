@@ -7,6 +7,7 @@
 #include "aaf_library/stored/StoredNames.h"
 
 #include <algorithm>
+#include <array>
 #include <deque>
 #include <map>
 #include <numeric>
@@ -28,6 +29,7 @@ namespace aaf::stored {
 namespace {
 
 constexpr std::size_t kLargestValue = 0xFFFF;
+constexpr std::size_t kEntrySize = 6;
 
 // The table of paths to the sets that weak references lead to. A path gets
 // its tag when it is used first.
@@ -108,9 +110,11 @@ struct Layout {
             throw StoredError(std::to_string(size) + " bytes, a value may take " +
                               std::to_string(kLargestValue));
         }
-        entries.AppendNumber(property.pid)
-            .AppendNumber(static_cast<std::uint16_t>(property.form))
-            .AppendNumber(static_cast<std::uint16_t>(size));
+        std::array<std::uint8_t, kEntrySize> entry;
+        PutNumber(entry.data(), property.pid);
+        PutNumber(entry.data() + 2, static_cast<std::uint16_t>(property.form));
+        PutNumber(entry.data() + 4, static_cast<std::uint16_t>(size));
+        entries.Append(entry);
         ++count;
     }
     void AddName(const StoredProperty& property, const std::u16string& name) {
@@ -152,10 +156,11 @@ public:
     }
 
     std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
-                                          const std::vector<TargetPath>& paths) {
+                                          const std::vector<TargetPath>& paths,
+                                          CompoundPlace place) {
         paths_.BeginWith(paths);
         Fill(CompoundFileWriter::kRoot, object, 0);
-        std::optional<CompoundPart> part = file_.FinishPart();
+        std::optional<CompoundPart> part = file_.FinishPart(place);
         return part ? std::make_shared<const LaidOut>(LaidOut{std::move(*part), paths}) : nullptr;
     }
 
@@ -320,7 +325,8 @@ private:
             const StoredObject& object = property.objects[order[i]];
             const Bytes& key = property.keys[order[i]];
             const StoredProperty* stored = object.Find(property.keyPid);
-            const bool hasKey = stored != nullptr && stored->bytes == key;
+            const bool hasKey =
+                object.laidOut != nullptr || (stored != nullptr && stored->bytes == key);
             if (!hasKey && property.problem.empty()) {
                 throw StoredError("an element does not store its key");
             }
@@ -416,14 +422,14 @@ Bytes WriteTree(const StoredObject& root, SectorSize sectorSize) {
     return TreeWriter(sectorSize).Write(root).Finish();
 }
 
-std::vector<Bytes> WriteTreeInPieces(const StoredObject& root, SectorSize sectorSize) {
+std::vector<Piece> WriteTreeInPieces(const StoredObject& root, SectorSize sectorSize) {
     return TreeWriter(sectorSize).Write(root).FinishPieces();
 }
 
 std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
-                                      const std::vector<TargetPath>& paths) {
+                                      const std::vector<TargetPath>& paths, CompoundPlace place) {
     try {
-        return TreeWriter(SectorSize::Bytes512).LayOut(object, paths);
+        return TreeWriter(SectorSize::Bytes512).LayOut(object, paths, place);
     } catch (const TooLargeError&) {
         return nullptr;  // the file that it goes into tells
     }

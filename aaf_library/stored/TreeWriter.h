@@ -13,7 +13,7 @@ namespace aaf::stored {
 // order of their keys. The same tree gives the same bytes. Throws StoredError.
 Bytes WriteTree(const StoredObject& root, SectorSize sectorSize);
 // The same in pieces, which follow each other.
-std::vector<Bytes> WriteTreeInPieces(const StoredObject& root, SectorSize sectorSize);
+std::vector<Piece> WriteTreeInPieces(const StoredObject& root, SectorSize sectorSize);
 
 using TargetPath = std::vector<std::uint16_t>;
 
@@ -24,9 +24,11 @@ struct LaidOut {
     std::vector<TargetPath> paths;
 };
 
-// For objects that many files hold. Null when it can't be shared: one of its
-// streams is too long for that, or all of it too large. Throws StoredError.
+// For objects that many files hold; in that place of a file their bytes are not even copied. Null
+// when it can't be shared: one of its streams is too long for that, or all of it too large. Throws
+// StoredError.
 std::shared_ptr<const LaidOut> LayOut(const StoredObject& object,
-                                      const std::vector<TargetPath>& paths);
+                                      const std::vector<TargetPath>& paths,
+                                      CompoundPlace place = {});
 
 }  // namespace aaf::stored

@@ -7,12 +7,12 @@
 
 namespace aaf::stored {
 
-bool WritePieces(const std::filesystem::path& file, const std::vector<Bytes>& pieces) {
+bool WritePieces(const std::filesystem::path& file, const std::vector<Piece>& pieces) {
     errno = 0;
     std::ofstream out(file, std::ios::binary | std::ios::trunc);
-    for (const Bytes& bytes : pieces) {
-        out.write(reinterpret_cast<const char*>(bytes.data()),
-                  static_cast<std::streamsize>(bytes.size()));
+    for (const Piece& piece : pieces) {
+        out.write(reinterpret_cast<const char*>(piece.data),
+                  static_cast<std::streamsize>(piece.size));
     }
     out.close();
     return !out.fail();

@@ -13,11 +13,11 @@ namespace {
 
 constexpr std::size_t kMostAtOnce = std::size_t{1} << 24;
 
-bool WriteAll(HANDLE file, const Bytes& bytes) {
-    for (std::size_t at = 0; at < bytes.size();) {
+bool WriteAll(HANDLE file, const Piece& piece) {
+    for (std::size_t at = 0; at < piece.size;) {
         DWORD done = 0;
-        const auto size = static_cast<DWORD>(std::min(bytes.size() - at, kMostAtOnce));
-        if (!WriteFile(file, bytes.data() + at, size, &done, nullptr) || done == 0) {
+        const auto size = static_cast<DWORD>(std::min(piece.size - at, kMostAtOnce));
+        if (!WriteFile(file, piece.data + at, size, &done, nullptr) || done == 0) {
             return false;
         }
         at += done;
@@ -34,14 +34,14 @@ bool Failed() {
 
 }  // namespace
 
-bool WritePieces(const std::filesystem::path& file, const std::vector<Bytes>& pieces) {
+bool WritePieces(const std::filesystem::path& file, const std::vector<Piece>& pieces) {
     const HANDLE out = CreateFileW(file.c_str(), GENERIC_WRITE, FILE_SHARE_READ | FILE_SHARE_DELETE,
                                    nullptr, CREATE_ALWAYS, FILE_ATTRIBUTE_NORMAL, nullptr);
     if (out == INVALID_HANDLE_VALUE) {
         return Failed();
     }
     const bool isWritten = std::all_of(pieces.begin(), pieces.end(),
-                                       [&](const Bytes& bytes) { return WriteAll(out, bytes); });
+                                       [&](const Piece& piece) { return WriteAll(out, piece); });
     const bool isFine = isWritten || Failed();
     return CloseHandle(out) ? isFine : Failed();
 }

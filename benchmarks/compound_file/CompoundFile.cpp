@@ -81,8 +81,8 @@ void Time(benchmark::State& state, const Node& root, const compound::Bytes& file
 void Ours(benchmark::State& state, const Node& root) {
     Time(state, root, compound::Written(root, kSectors), [&] {
         std::size_t size = 0;
-        for (const compound::Bytes& piece : compound::WrittenInPieces(root, kSectors)) {
-            size += piece.size();
+        for (const aaf::stored::Piece& piece : compound::WrittenInPieces(root, kSectors)) {
+            size += piece.size;
         }
         return size;
     });

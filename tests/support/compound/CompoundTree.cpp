@@ -109,7 +109,7 @@ Bytes Written(const Node& root, SectorSize sectorSize) {
     return writer.Finish();
 }
 
-std::vector<Bytes> WrittenInPieces(const Node& root, SectorSize sectorSize) {
+std::vector<aaf::stored::Piece> WrittenInPieces(const Node& root, SectorSize sectorSize) {
     CompoundFileWriter writer(sectorSize);
     Add(writer, CompoundFileWriter::kRoot, root);
     return writer.FinishPieces();

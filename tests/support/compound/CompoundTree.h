@@ -2,6 +2,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "aaf_library/stored/Pieces.h"
 #include "aaf_library/stored/StoredTree.h"
 
 #include <string>
@@ -31,7 +32,7 @@ Bytes Content(std::size_t size);
 
 // By the library's own writer and reader. They throw StoredError.
 Bytes Written(const Node& root, SectorSize sectorSize);
-std::vector<Bytes> WrittenInPieces(const Node& root, SectorSize sectorSize);
+std::vector<aaf::stored::Piece> WrittenInPieces(const Node& root, SectorSize sectorSize);
 Node Read(const Bytes& file);
 
 // Where two trees differ, as a sentence; empty when they are equal. The order of nodes does not

@@ -11,6 +11,7 @@
 #include "host_interfaces/aaf/AAFDefinitions.h"
 #include "host_interfaces/aaf/AAFDescriptors.h"
 #include "host_interfaces/aaf/AAFDictionary.h"
+#include "host_interfaces/aaf/AAFEffectDefinitions.h"
 #include "host_interfaces/aaf/AAFMetaDefinitions.h"
 #include "host_interfaces/aaf/AAFMobSlots.h"
 #include "host_interfaces/aaf/AAFMobs.h"
@@ -183,6 +184,24 @@ protected:
         EXPECT_FALSE(saved.empty());
         EXPECT_TRUE(saved == Content(path_));
     }
+    // Straight from the source's objects, and by way of a copy of each.
+    void ExpectTheSameBytesByEitherWay() {
+        ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(target_));
+        const std::wstring other = Path("copied.aaf");
+        Ptr<IAAFFile> copied = NewFile(other);
+        Get(copied, &IAAFFile::GetHeader);  // who looks at it makes it take a copy
+        ASSERT_EQ(AAFRESULT_SUCCESS, file_->SaveCopyAs(copied));
+        EXPECT_FALSE(Content(path_).empty());
+        EXPECT_TRUE(Content(other) == Content(path_));
+    }
+    Ptr<IAAFPropertyDef> RegisterNumberOfMobs(const aafUID_t& id) {
+        Ptr<IAAFPropertyDef> property;
+        Ptr<IAAFClassDef> mobs = Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFMob);
+        Ptr<IAAFTypeDef> type = Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_Int32);
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  mobs->RegisterOptionalPropertyDef(id, L"Late", type, property.Out()));
+        return property;
+    }
     void ExpectThreeMobs(IAAFFile* file) {
         Ptr<IAAFHeader> header;
         ASSERT_EQ(AAFRESULT_SUCCESS, file->GetHeader(header.Out()));
@@ -276,6 +295,69 @@ TEST_F(TargetOfACopy, CanBeCopiedItself) {
     Get(third, &IAAFFile::GetHeader);
     ASSERT_EQ(AAFRESULT_SUCCESS, target_->SaveCopyAs(third));
     EXPECT_TRUE(Content(other) == Content(path));
+}
+
+TEST_F(TargetOfACopy, NumbersItsPropertiesAsACopyDoes) {
+    // The built-in model leaves the numbers of these to each file, which allots them here before
+    // those of a property that is registered.
+    Ptr<IAAFMPEGVideoDescriptor> mpeg = Make<IAAFMPEGVideoDescriptor>(AUID_AAFMPEGVideoDescriptor);
+    ASSERT_EQ(AAFRESULT_SUCCESS, mpeg->Initialize());
+    ASSERT_EQ(AAFRESULT_SUCCESS, mpeg->SetMaxGOP(15));
+    ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->AppendFileDescriptor(As<IAAFFileDescriptor>(mpeg)));
+    RegisterNumberOfMobs(ncfGuid("ABCDEF00-0000-0000-0000-00000000000A"));
+    ExpectTheSameBytesByEitherWay();
+}
+
+TEST_F(TargetOfACopy, LacksDefinitionsThatNothingUses) {
+    Ptr<IAAFOperationDef> operation = Make<IAAFOperationDef>(AUID_AAFOperationDefinition);
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFDefObject>(operation)->Initialize(
+                                     ncfGuid("ABCDEF00-0000-0000-0000-00000000000B"), L"Unused"));
+    ASSERT_EQ(AAFRESULT_SUCCESS, dictionary_->RegisterOperationDef(operation));
+    // Of the containers that each file knows, one is looked up and another is used.
+    const aafUID_t idle = ncfGuid("0D010301-0201-0101-060E-2B3404010101");
+    const aafUID_t used = ncfGuid("0D010301-0201-0201-060E-2B3404010101");
+    Get(dictionary_, &IAAFDictionary::LookupContainerDef, idle);
+    Ptr<IAAFCDCIDescriptor> picture = Make<IAAFCDCIDescriptor>(AUID_AAFCDCIDescriptor);
+    ASSERT_EQ(AAFRESULT_SUCCESS, picture->Initialize());
+    Ptr<IAAFFileDescriptor> descriptor = As<IAAFFileDescriptor>(picture);
+    ASSERT_EQ(AAFRESULT_SUCCESS, descriptor->SetContainerFormat(
+                                     Get(dictionary_, &IAAFDictionary::LookupContainerDef, used)));
+    ASSERT_EQ(AAFRESULT_SUCCESS, multiple_->AppendFileDescriptor(descriptor));
+    ExpectTheSameBytesByEitherWay();
+}
+
+TEST_F(TargetOfACopy, HasBuiltInDefinitionsAsEveryNewFileHasThem) {
+    Ptr<IAAFDataDef> pictures = DataDef(kAAFDataDef_LegacyPicture);
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFDefObject>(pictures)->SetName(L"Renamed"));
+    ExpectTheSameBytesByEitherWay();
+}
+
+TEST_F(TargetOfACopy, HasTheNamesOfTheBuiltInModel) {
+    Ptr<IAAFClassDef> mobs = Get(dictionary_, &IAAFDictionary::LookupClassDef, AUID_AAFMob);
+    ASSERT_EQ(AAFRESULT_SUCCESS, As<IAAFMetaDefinition>(mobs)->SetName(L"Renamed"));
+    ExpectTheSameBytesByEitherWay();
+}
+
+TEST_F(TargetOfACopy, LacksWhatIsRegisteredLater) {
+    ExpectItKeepsWhatWasSavedWhen(
+        "property", [&] { RegisterNumberOfMobs(ncfGuid("ABCDEF00-0000-0000-0000-00000000000C")); });
+}
+
+TEST_F(TargetOfACopy, KeepsTheNameOfWhatWasRegistered) {
+    Ptr<IAAFPropertyDef> property =
+        RegisterNumberOfMobs(ncfGuid("ABCDEF00-0000-0000-0000-00000000000D"));
+    ExpectItKeepsWhatWasSavedWhen("name", [&] {
+        EXPECT_EQ(AAFRESULT_SUCCESS, As<IAAFMetaDefinition>(property)->SetName(L"Renamed"));
+    });
+}
+
+TEST_F(TargetOfACopy, LacksAMemberThatAnEnumerationGetsLater) {
+    Ptr<IAAFTypeDefExtEnum> uses = As<IAAFTypeDefExtEnum>(
+        Get(dictionary_, &IAAFDictionary::LookupTypeDef, kAAFTypeID_UsageType));
+    ExpectItKeepsWhatWasSavedWhen("member", [&] {
+        EXPECT_EQ(AAFRESULT_SUCCESS,
+                  uses->AppendElement(ncfGuid("ABCDEF00-0000-0000-0000-00000000000E"), L"Own"));
+    });
 }
 
 TEST_F(TargetOfACopy, SeveralTargetsOfOneSourceKeepTheirs) {

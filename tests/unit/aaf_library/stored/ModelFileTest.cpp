@@ -84,6 +84,23 @@ TEST(ModelFile, WhatIsLaidOutOnceGivesTheSameBytes) {
     }
 }
 
+TEST(ModelFile, FilesShareTheBytesOfTheirDefinitions) {
+    const sample::SampleModel sample = sample::WholeModel();
+    const auto pieces = [&] {
+        return WriteTreeInPieces(TreeToWrite(*sample.model, *sample.header), SectorSize::Bytes512);
+    };
+    const std::vector<Piece> first = pieces();
+    const std::vector<Piece> second = pieces();
+    ASSERT_EQ(first.size(), second.size());
+    std::size_t all = 0;
+    std::size_t shared = 0;
+    for (std::size_t i = 0; i < first.size(); ++i) {
+        all += first[i].size;
+        shared += first[i].data == second[i].data ? first[i].size : 0;
+    }
+    EXPECT_GT(shared, all / 2);
+}
+
 // A name that was set makes the writer look at the definitions themselves.
 TEST(ModelFile, TheBuiltInTablesSayWhatTheDefinitionsSay) {
     const RefPtr<Model> renamed = sample::NewModel();
