@@ -79,9 +79,9 @@ Times FarAway(std::size_t count) {
     return Times(count, {100, static_cast<std::int64_t>(count) * 50});
 }
 
-class FakeMap final : public StubSampleMapping {
+class FakeTimes final : public StubSampleMapping {
 public:
-    explicit FakeMap(Times times) : times_(std::move(times)) {}
+    explicit FakeTimes(Times times) : times_(std::move(times)) {}
 
     NCFRESULT GetSampleTemporalOffset(ncfUInt32, ncfUInt64 sample, ncfSInt64* offset) override {
         ++asked;
@@ -124,7 +124,7 @@ TEST(TemporalOffsets, AreThoseOfTheSearchOutward) {
 
 TEST(TemporalOffsets, AskTheModuleWhereItIsNear) {
     const Times times = Groups(3000);
-    FakeMap map(times);
+    FakeTimes map(times);
     bool isRead = false;
     TemporalOffsets offsets(map, 0, [&] {
         isRead = true;
@@ -142,7 +142,7 @@ TEST(TemporalOffsets, TakeTheModuleAFewStepsForEachSample) {
     for (const auto make : {Nowhere, FarAway, Groups}) {
         for (const std::size_t count : {2000u, 20000u}) {
             const Times times = make(count);
-            FakeMap map(times);
+            FakeTimes map(times);
             TemporalOffsets offsets(map, 0, [&] { return times; });
             for (std::size_t i = 0; i < count; ++i) {
                 offsets.Of(i);
@@ -155,7 +155,7 @@ TEST(TemporalOffsets, TakeTheModuleAFewStepsForEachSample) {
 TEST(TemporalOffsets, ComeFromTheModuleAloneWhereTheTablesSayOtherwise) {
     const Times times = FarAway(400);
     for (const Times& others : {Times(), Times(3, {1, 1}), Groups(400), Nowhere(400)}) {
-        FakeMap map(times);
+        FakeTimes map(times);
         TemporalOffsets offsets(map, 0, [&] { return others; });
         for (std::size_t i = 0; i < times.size(); ++i) {
             ASSERT_EQ(offsets.Of(i), Outward(times, static_cast<std::int64_t>(i))) << i;
