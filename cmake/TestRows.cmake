@@ -2,22 +2,29 @@
 # APART. The rows are listed anew whenever the program is newer than their list.
 #   name, program, rows: the program's name and file, and where its list is kept
 #   apart: regular expressions of suites; filter: of the tests; properties: of each row
+#   emulator: the command that runs the program, or empty; with one, the suites that aren't apart are one row
+#   left_out: patterns that the filter leaves out, of which each has to fit a test
 if(NOT EXISTS "${program}")
   add_test("${name}_NOT_BUILT" "${name}_NOT_BUILT")
   return()
 endif()
 
-function(list_rows)
-  execute_process(COMMAND "${program}" --gtest_list_tests "--gtest_filter=${filter}"
+function(list_tests filter lines)
+  execute_process(COMMAND ${emulator} "${program}" --gtest_list_tests "--gtest_filter=${filter}"
                   TIMEOUT 60 OUTPUT_VARIABLE listed RESULT_VARIABLE result)
   if(NOT result STREQUAL 0)
     message(FATAL_ERROR "${name} can't list its tests: ${result}\n${listed}")
   endif()
   # The value of a parameter is behind its number or name, as a comment.
   string(REGEX REPLACE " *#[^\n]*" "" listed "${listed}")
-  string(REPLACE "\n" ";" listed "${listed}")
+  string(REGEX REPLACE "\r?\n" ";" listed "${listed}")
+  set(${lines} "${listed}" PARENT_SCOPE)
+endfunction()
 
+function(list_rows)
+  list_tests("${filter}" listed)
   set(script "")
+  set(together "")
   foreach(line IN LISTS listed)
     if(line MATCHES "^  (.+)")
       if(is_apart)
@@ -26,11 +33,16 @@ function(list_rows)
     elseif(line MATCHES "^(.+)\\.$")
       set(suite "${line}")
       is_one_of("${CMAKE_MATCH_1}" is_apart)
-      if(NOT is_apart)
+      if(NOT is_apart AND emulator)
+        string(APPEND together "${suite}*:")
+      elseif(NOT is_apart)
         add_row("${name}.${CMAKE_MATCH_1}" "${suite}*")
       endif()
     endif()
   endforeach()
+  if(together)
+    add_row("${name}" "${together}")
+  endif()
   if(script STREQUAL "")
     message(FATAL_ERROR "${name} lists no tests")
   endif()
@@ -38,6 +50,29 @@ function(list_rows)
   string(RANDOM LENGTH 12 suffix)
   file(WRITE "${rows}.${suffix}" "${script}")
   file(RENAME "${rows}.${suffix}" "${rows}")
+endfunction()
+
+# Ends with an error where a pattern fits no test. Patterns have the wildcard * alone.
+function(check_left_out)
+  list(JOIN left_out ":" all)
+  list_tests("${all}" listed)
+  set(tests "")
+  foreach(line IN LISTS listed)
+    if(line MATCHES "^  (.+)")
+      list(APPEND tests "${suite}${CMAKE_MATCH_1}")
+    else()
+      set(suite "${line}")
+    endif()
+  endforeach()
+  foreach(pattern IN LISTS left_out)
+    string(REPLACE "." "\\." expression "${pattern}")
+    string(REPLACE "*" ".*" expression "${expression}")
+    set(fitting "${tests}")
+    list(FILTER fitting INCLUDE REGEX "^${expression}$")
+    if(NOT fitting)
+      message(FATAL_ERROR "${name} has no test ${pattern} that could be left out")
+    endif()
+  endforeach()
 endfunction()
 
 # A suite's name may have an instance's before it and a type's number behind it.
@@ -52,8 +87,10 @@ endfunction()
 
 # Text for `script`, in the caller's scope. What the filter leaves out is left out of a suite, too.
 macro(add_row row tests)
-  string(REGEX MATCH "-.*" left_out "${filter}")
-  string(APPEND script "add_test([==[${row}]==] [==[${program}]==] [==[--gtest_filter=${tests}${left_out}]==])\n"
+  list(TRANSFORM emulator REPLACE "(.+)" "[==[\\1]==]" OUTPUT_VARIABLE command)
+  list(JOIN command " " command)
+  string(REGEX MATCH "-.*" without "${filter}")
+  string(APPEND script "add_test([==[${row}]==] ${command} [==[${program}]==] [==[--gtest_filter=${tests}${without}]==])\n"
                        "set_tests_properties([==[${row}]==] PROPERTIES SKIP_RETURN_CODE 77")
   foreach(property IN LISTS properties)
     string(APPEND script " [==[${property}]==]")
@@ -63,6 +100,9 @@ endmacro()
 
 if("${program}" IS_NEWER_THAN "${rows}" OR "${CMAKE_CURRENT_LIST_FILE}" IS_NEWER_THAN "${rows}"
    OR "${CMAKE_PARENT_LIST_FILE}" IS_NEWER_THAN "${rows}")
+  if(left_out)
+    check_left_out()
+  endif()
   list_rows()
 endif()
 include("${rows}")

@@ -32,7 +32,7 @@ rule 'throw typed codes, never literals or raw results' 'throw (0x|-?[0-9]|hr\b|
 rule 'a long text has no fixed width here' '\b(unsigned )?long [a-z_A-Z]+ *(=|;|,|\))' -- source
 
 rule 'a path in a command needs Quoted()' \
-  '(RunCommand|RunCliphost|popen|system)\(.*\.string\(\)' -- tests
+  '(RunCommand|RunCliphost|popen|system)\(.*\.(u8)?string\(\)' -- tests
 while read -r file; do
   if [ "$(grep -c 'add_custom_command(' "$file")" != "$(grep -cw VERBATIM "$file")" ]; then
     echo "$file: add_custom_command needs VERBATIM, or a parenthesis in a path breaks the build"

@@ -31,7 +31,10 @@ public:
             isStandardInput_ ? nullptr : host::system::OpenToRead(name_), CloseIfOpen);
         std::FILE* const file = isStandardInput_ ? stdin : opened.get();
         if (file == nullptr) {
-            FailForSystem(errno);
+            const int error = errno;
+            std::error_code ignored;
+            // Windows says that a folder is not permitted.
+            FailForSystem(std::filesystem::is_directory(name_, ignored) ? EISDIR : error);
         }
         char piece[65536];
         for (std::size_t got; (got = std::fread(piece, 1, sizeof piece, file)) > 0;) {

@@ -11,15 +11,20 @@ trap 'rm -rf "$folder"' EXIT
 fail() { printf 'test_rows: %s\n' "$*" >&2; exit 1; }
 cd "$folder"
 
-cat >CTestTestfile.cmake <<CMAKE
+settings() { # settings [LINE ...]: those of every program, and these
+  { cat <<CMAKE
 set(name test_some)
 set(program "$folder/test_some")
 set(rows "$folder/test_some_rows.cmake")
 set(apart "Apart")
 set(filter "*")
 set(properties TIMEOUT 5)
-include("$rows_script")
 CMAKE
+    [ $# = 0 ] || printf '%s\n' "$@"
+    printf 'include("%s")\n' "$rows_script"
+  } >CTestTestfile.cmake
+}
+settings
 program() { # program LINE ...: lists these
   { printf '#!/bin/sh\n'; [ $# = 0 ] || printf 'echo "%s"\n' "$@"; } >test_some
   chmod +x test_some
@@ -40,6 +45,28 @@ said=$("$ctest" -V 2>&1) || fail "a row that is skipped fails: $said"
 grep -q 'test_some.First .*Skipped' <<<"$said" || fail "a row that is skipped counts as another: $said"
 grep -q 'no browser' <<<"$said" || fail "a row that is skipped does not say why: $said"
 
+printf '#!/bin/sh\nexec "$@"\n' >run
+chmod +x run
+settings "set(emulator \"$folder/run\")"
+program First. '  One' Second. '  Two' Apart. '  Three' '  Four'
+listed=$("$ctest" -N)
+for row in test_some Apart.Three Apart.Four; do
+  grep -q ": $row\$" <<<"$listed" || fail "no row $row under an emulator: $listed"
+done
+grep -q '^Total Tests: 3$' <<<"$listed" || fail "other rows under an emulator: $listed"
+grep -qF "$folder/run" test_some_rows.cmake || fail "the emulator is not called"
+
+settings 'set(left_out First.One "Apart.T*")'
+rm test_some_rows.cmake
+"$ctest" -N >/dev/null || fail "tests that there are can't be left out"
+settings 'set(left_out First.One Apart.Five)'
+rm test_some_rows.cmake
+if said=$("$ctest" -N 2>&1); then
+  fail "a test that there isn't is left out"
+fi
+grep -q 'test_some has no test Apart.Five' <<<"$said" || fail "ctest says: $said"
+
+settings
 program
 if said=$("$ctest" 2>&1); then
   fail "a program without tests is taken: $said"

@@ -12,6 +12,8 @@
 #include <fstream>
 #include <string>
 
+#include "tests/support/Environment.h"
+
 namespace {
 
 constexpr int kNothingRan = 2;
@@ -68,7 +70,9 @@ int main(int argc, char** argv) {
     }
     tests.listeners().Append(new Tally);
     // No program that a test starts may read the settings of who runs the tests.
-    setenv("XDG_CONFIG_HOME", "/nonexistent", 1);
+    for (const char* const place : {"XDG_CONFIG_HOME", "APPDATA"}) {
+        SetVariable(place, "/nonexistent");
+    }
     program = getpid();
     std::atexit(FailWhenATestExits);
     const int status = RUN_ALL_TESTS();

@@ -1,13 +1,13 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 
-#include <chrono>
 #include <filesystem>
 #include <fstream>
 
 #include "host_interfaces/aaf/AAFMobs.h"
 #include "source/aaf/Timecode.h"
 #include "source/plugin/os/Os.h"
+#include "tests/support/TestFiles.h"
 #include "tests/support/fakes/FakeLock.h"
 #include "tests/unit/aaf/support/AAFTest.h"
 
@@ -22,15 +22,10 @@ protected:
 
     // Gives the clip a file that was written at a time of a day in UTC.
     void MakeFile(int hour, int minute, int second) {
-        using namespace std::chrono;
         const std::string path = Write("a clip.mov", "bytes");
         // 2001-09-09, a Sunday.
-        const auto since1970 = hours(24) * 11574 + hours(hour) + minutes(minute) + seconds(second);
-        const auto onSystemClock = system_clock::time_point(since1970);
-        std::filesystem::last_write_time(
-            path, std::filesystem::file_time_type::clock::now() +
-                      duration_cast<std::filesystem::file_time_type::duration>(
-                          onSystemClock - system_clock::now()));
+        SetDate(std::filesystem::u8path(path),
+                86400LL * 11574 + 3600 * hour + 60 * minute + second);
         INCFString* const name = MakeHostString(path);
         clip->setFileName(name);
         name->Release();

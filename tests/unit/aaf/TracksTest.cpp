@@ -429,7 +429,7 @@ TEST_F(TracksTest, SlotsThatAreRefusedAreLoggedAndReturned) {
 }
 
 TEST_F(TracksTest, MissingDataFilesEndEveryClipWithVideo) {
-    std::filesystem::remove(Folder() + "AAFInfo.xml");
+    std::filesystem::remove(std::filesystem::u8path(Folder() + "AAFInfo.xml"));
     clip->timecode.resize(1);
     for (int time = 1; time <= 2; ++time) {
         EXPECT_EQ(Add(), NCF_E_UNEXPECTED);

@@ -22,7 +22,7 @@ protected:
     Arrivals::Clock::time_point now_{};
     std::map<std::string, host::system::FileState> files_;
     Arrivals arrivals_{5s, [this](const std::filesystem::path& file) {
-                           const auto found = files_.find(file.native());
+                           const auto found = files_.find(file.u8string());
                            return found == files_.end() ? std::nullopt
                                                         : std::optional(found->second);
                        }};
@@ -82,7 +82,7 @@ TEST_F(ArrivalsTest, MayGoAway) {
 }
 
 TEST_F(ArrivalsTest, ComeAgainAfterTheyWereRemovedAndNobodyTold) {
-    const std::string here = (std::filesystem::temp_directory_path() / "a").string();
+    const std::string here = (std::filesystem::temp_directory_path() / "a").u8string();
     for (const std::string& file : {here, std::string("/no/such/folder/b")}) {
         Write(file, 1);
         See(file);

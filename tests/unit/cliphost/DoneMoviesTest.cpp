@@ -53,7 +53,7 @@ TEST_F(DoneMoviesTest, HaveWhatAllRunsBeforeHaveMade) {
     EXPECT_TRUE(Has("a.mov", "a.aaf"));
     EXPECT_TRUE(Has("b.mov", "b.aaf"));
     EXPECT_TRUE(Has("./x/../a.mov", "a.aaf")) << "the same file";
-    EXPECT_TRUE(Has(std::filesystem::absolute("a.mov"), "a.aaf"));
+    EXPECT_TRUE(Has(std::filesystem::absolute("a.mov").u8string(), "a.aaf"));
     EXPECT_FALSE(Has("x/a.mov", "a.aaf"));
     EXPECT_FALSE(Has("a.mov", "b.aaf"));
 }

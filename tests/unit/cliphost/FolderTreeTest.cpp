@@ -3,9 +3,9 @@
 #include "reference_host/cliphost/FolderTree.h"
 
 #include <gtest/gtest.h>
-#include <sys/stat.h>
 
 #include "reference_host/cliphost/Failure.h"
+#include "tests/support/TestFiles.h"
 #include "tests/unit/cliphost/TestFolder.h"
 
 using namespace cliphost;
@@ -28,7 +28,7 @@ protected:
     Names Found() {
         Names names;
         for (const std::filesystem::path& found : FoldersIn(folder_.path())) {
-            names.push_back(found.lexically_relative(folder_.path()));
+            names.push_back(found.lexically_relative(folder_.path()).generic_u8string());
         }
         return names;
     }
@@ -54,7 +54,7 @@ TEST_F(FolderTree, FollowsLinksAndEndsCircles) {
     const TestFolder other;
     std::filesystem::create_directories(other / "far");
     std::filesystem::create_directory_symlink(folder_.path(), other / "back");
-    Link(other.path(), "zz");
+    Link(other.path().u8string(), "zz");
     EXPECT_EQ(Found(), (Names{".", "a", "a/b", "zz", "zz/far"}));
 }
 
@@ -102,11 +102,11 @@ TEST_F(FolderTree, FindsFilesByTheirEndings) {
     }
     Link("a.mp4", "link.mp4");
     Link("nowhere", "broken.mp4");
-    ASSERT_EQ(mkfifo((folder_ / "pipe.mp4").c_str(), 0600), 0);
+    ASSERT_TRUE(MakePipe(folder_ / "pipe.mp4"));
     const EndingMatches found = FilesByEnding(folder_.path(), {"mp4", "mxf"});
     Names names;
     for (const std::filesystem::path& file : found.files) {
-        names.push_back(file.filename());
+        names.push_back(file.filename().u8string());
     }
     EXPECT_EQ(names, (Names{".x.mp4", "a.mp4", "b.MP4", "f.m.Mxf", "link.mp4"}));
     ASSERT_EQ(found.noFiles.size(), 2u);

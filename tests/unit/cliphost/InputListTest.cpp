@@ -17,7 +17,11 @@ using Paths = std::vector<std::string>;
 Paths PathsOf(const std::string& content, ListForm form = ListForm::Lines) {
     const TestFolder folder;
     WriteFile(folder / "list", content);
-    return ReadInputList(folder / "list", form);
+    Paths paths;
+    for (const auto& path : ReadInputList(folder / "list", form)) {
+        paths.push_back(std::filesystem::path(path).u8string());
+    }
+    return paths;
 }
 
 std::string WhyRefused(const std::filesystem::path& list, ListForm form = ListForm::Lines) {
@@ -89,18 +93,19 @@ TEST(InputList, HasNoLimitOfLength) {
 
 TEST(InputList, RefusesWhatIsNone) {
     const TestFolder folder;
-    const std::string list = folder / "list";
-    EXPECT_EQ(WhyRefused(list), list + ": the list can't be read: No such file or directory");
+    const std::filesystem::path file = folder / "list";
+    const std::string list = file.u8string();
+    EXPECT_EQ(WhyRefused(file), list + ": the list can't be read: No such file or directory");
     EXPECT_EQ(WhyRefused(folder.path()),
-              folder.path().string() + ": the list can't be read: Is a directory");
-    WriteFile(list, std::string("a\0b\0", 4));
-    EXPECT_EQ(WhyRefused(list), list +
+              folder.path().u8string() + ": the list can't be read: Is a directory");
+    WriteFile(file, std::string("a\0b\0", 4));
+    EXPECT_EQ(WhyRefused(file), list +
                                     ": the list has a byte of zero in it; give -0 where its "
                                     "paths end with one");
-    WriteFile(list, std::string("\xFF\xFE"
+    WriteFile(file, std::string("\xFF\xFE"
                                 "a\0\n\0",
                                 6));
-    EXPECT_EQ(WhyRefused(list), list + ": the list is in UTF-16; save it as UTF-8");
+    EXPECT_EQ(WhyRefused(file), list + ": the list is in UTF-16; save it as UTF-8");
 }
 
 }  // namespace

@@ -12,7 +12,8 @@ using cliphost::AbsolutePath;
 using cliphost::MachinePath;
 
 TEST(MachinePath, IsThePathItselfWhereItIsText) {
-    EXPECT_EQ(MachinePath("a b/caf\xC3\xA9.mov"), "a b/caf\xC3\xA9.mov");
+    const std::string text = "a b/caf\xC3\xA9.mov";
+    EXPECT_EQ(MachinePath(std::filesystem::u8path(text)), text);
     EXPECT_EQ(MachinePath("/a\nb\\c.mov"), "/a\nb\\c.mov") << "JSON escapes these itself";
 }
 
@@ -56,7 +57,7 @@ TEST(AbsolutePath, GoesWhereALinkLeads) {
                   {"dead/../../x.mov", "dead/../../x.mov"},
                   {"a//b/", "a/b/"}};
     for (const auto& path : kPaths) {
-        EXPECT_EQ(AbsolutePath(root / path.path).native(), (root / path.absolute).native());
+        EXPECT_EQ(AbsolutePath(root / path.path).u8string(), (root / path.absolute).u8string());
     }
     EXPECT_EQ(AbsolutePath("x.mov"), std::filesystem::current_path() / "x.mov");
     EXPECT_EQ(AbsolutePath("/../x.mov"), "/x.mov");

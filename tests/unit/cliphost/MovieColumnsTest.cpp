@@ -46,10 +46,10 @@ TEST(MovieColumns, FindsByPathsBehindLinks) {
     const TestFolder folder;
     std::filesystem::create_directories(folder.path() / "a/b");
     std::filesystem::create_directory_symlink("a/b", folder.path() / "link");
-    const std::string path = folder.path() / "link/../c.mov";
+    const std::string path = (folder.path() / "link/../c.mov").u8string();
     const MovieColumns columns("t.csv", "path,Scene\n" + CsvLine({path, "1"}));
-    EXPECT_EQ(RowOf(columns, (folder.path() / "a/c.mov").c_str()), 2u);
-    EXPECT_EQ(RowOf(columns, (folder.path() / "c.mov").c_str()), 0u);
+    EXPECT_EQ(RowOf(columns, (folder.path() / "a/c.mov").u8string().c_str()), 2u);
+    EXPECT_EQ(RowOf(columns, (folder.path() / "c.mov").u8string().c_str()), 0u);
 }
 
 // With a path the name is the clip's; where a row has none, it says which movie.

@@ -16,13 +16,13 @@ TEST(OutputProblem, TellsTheSystemsWordsAndWhatHelps) {
     const TestFolder folder;
     const std::filesystem::path file = folder / "a.aaf";
     EXPECT_EQ(LineOf(NotWritten(file, ENOSPC)),
-              file.string() +
+              file.u8string() +
                   ": not written: No space left on device; make room there or name another place");
     EXPECT_EQ(LineOf(NotWritten(file, EROFS)),
-              file.string() + ": not written: Read-only file system; name another place");
-    EXPECT_EQ(LineOf(NotWritten(file, EIO)), file.string() + ": not written: Input/output error");
+              file.u8string() + ": not written: Read-only file system; name another place");
+    EXPECT_EQ(LineOf(NotWritten(file, EIO)), file.u8string() + ": not written: Input/output error");
     EXPECT_EQ(LineOf(FolderNotMade(file, EROFS)),
-              file.string() +
+              file.u8string() +
                   ": the folder can't be made: Read-only file system; name another "
                   "place");
 }
@@ -30,10 +30,10 @@ TEST(OutputProblem, TellsTheSystemsWordsAndWhatHelps) {
 TEST(OutputProblem, NamesTheFolderThatIsMissing) {
     const TestFolder folder;
     EXPECT_EQ(NotWritten(folder / "no/a.aaf", ENOENT).hint,
-              "make the folder " + (folder / "no").string() + " first");
+              "make the folder " + (folder / "no").u8string() + " first");
     EXPECT_EQ(NotWritten(folder / "a.aaf", ENOENT).hint, "") << "its folder is there";
     EXPECT_EQ(NotWritten("no/a.aaf", ENOENT).hint,
-              "make the folder " + (std::filesystem::current_path() / "no").string() + " first");
+              "make the folder " + (std::filesystem::current_path() / "no").u8string() + " first");
 }
 
 TEST(OutputProblem, FindsTheSystemsErrorInASentenceOfTheLibrary) {

@@ -61,16 +61,16 @@ TEST(PathMaps, TakeFileUrls) {
 }
 
 TEST(PathMaps, TakeAFolderFromTheWorkingFolder) {
-    const std::string here = std::filesystem::current_path();
+    const std::string here = std::filesystem::current_path().u8string();
     EXPECT_EQ(ToOther("a/../b=/x", "file://" + here + "/b/c.mov"), "file:///x/c.mov");
     EXPECT_EQ(ToOther(".=/x", "file://" + here + "/c.mov"), "file:///x/c.mov");
     // As the module is given it.
     const TestFolder folder;
     std::filesystem::create_directories(folder.path() / "a/b");
     std::filesystem::create_directory_symlink("a/b", folder.path() / "link");
-    const auto fromHere = folder.path().lexically_relative(here);
-    EXPECT_EQ(ToOther((fromHere / "link/..").string() + "=/x",
-                      host::text::FileUrl((folder.path() / "a/c.mov").native())),
+    const auto fromHere = folder.path().lexically_relative(std::filesystem::current_path());
+    EXPECT_EQ(ToOther((fromHere / "link/..").u8string() + "=/x",
+                      host::text::FileUrl((folder.path() / "a/c.mov").u8string())),
               "file:///x/c.mov");
 }
 

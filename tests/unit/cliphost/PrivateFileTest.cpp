@@ -92,7 +92,7 @@ TEST_F(PrivateFiles, GoWithTheRequestTheyWereMadeFor) {
     RemovePrivateFiles(folder(), 1);
     std::set<std::string> left;
     for (const auto& entry : std::filesystem::directory_iterator(folder())) {
-        left.insert(entry.path().filename());
+        left.insert(entry.path().filename().u8string());
     }
     EXPECT_EQ(left, (std::set<std::string>{"0", "12", "12_1"}));
 }

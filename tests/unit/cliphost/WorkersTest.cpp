@@ -155,7 +155,7 @@ protected:
         std::filesystem::remove(starts_);
         WorkerCall call;
         call.program = "/bin/sh";
-        call.arguments = {"-c", "echo >>'" + starts_.string() + "'\n" + script};
+        call.arguments = {"-c", "echo >>'" + starts_.u8string() + "'\n" + script};
         call.jobs = 2;
         call.limits = limits;
         call.leanOnEachOther = leanOnEachOther;
@@ -249,7 +249,7 @@ TEST(Workers, GoOnWithTheOthersWhereOneDoesNotStartAnew) {
     const std::filesystem::path folder =
         std::filesystem::path(testing::TempDir()) / ("first-" + std::to_string(getpid()));
     const Client client =
-        RunShells("mkdir '" + folder.string() + "' 2>/dev/null || exit 1\n" + Ready() +
+        RunShells("mkdir '" + folder.u8string() + "' 2>/dev/null || exit 1\n" + Ready() +
                       "while true\ndo\n" + Request() + Answer("fine") + "done\n",
                   6, 3);
     std::filesystem::remove(folder);
@@ -300,9 +300,9 @@ TEST(Workers, FailWhereTheLastCanNotBeStartedAnew) {
     WorkerCall call;
     call.program = folder / "sh";
     std::filesystem::copy_file("/bin/sh", call.program);
-    call.arguments = {"-c", "mkdir '" + (folder / "first").string() + "' 2>/dev/null || exit 1\n" +
-                                Ready() + Request() + "sleep 0.3; rm '" + call.program.string() +
-                                "'\n" + Answer("fine")};
+    call.arguments = {
+        "-c", "mkdir '" + (folder / "first").u8string() + "' 2>/dev/null || exit 1\n" + Ready() +
+                  Request() + "sleep 0.3; rm '" + call.program.u8string() + "'\n" + Answer("fine")};
     call.jobs = 2;
     Client client;
     EXPECT_THROW(RunInWorkers(call, std::vector<std::string>(4, "x"), client), Failure);

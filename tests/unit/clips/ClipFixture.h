@@ -3,9 +3,9 @@
 #pragma once
 
 #include <gtest/gtest.h>
-#include <unistd.h>
 
 #include <algorithm>
+#include <filesystem>
 #include <fstream>
 #include <memory>
 #include <string>
@@ -24,8 +24,8 @@
 class TempFile {
 public:
     explicit TempFile(const std::vector<ncfUInt8>& bytes, const std::string& name = "clip.mov")
-        : path_((folder_ / name).string()) {
-        std::ofstream file(path_, std::ios::binary);
+        : path_((folder_ / name).u8string()) {
+        std::ofstream file(std::filesystem::u8path(path_), std::ios::binary);
         file.write(reinterpret_cast<const char*>(bytes.data()),
                    static_cast<std::streamsize>(bytes.size()));
     }
@@ -39,7 +39,8 @@ private:
 
 // The path of a movie that is not there.
 inline std::string NoSuchMovie() {
-    return (TestFolder() / "no_such_movie.mov").string();
+    static const TestFolder folder;
+    return (folder / "no_such_movie.mov").u8string();
 }
 
 // Bytes that tell their own place: 0, 1, ... 250, 0, 1, ...

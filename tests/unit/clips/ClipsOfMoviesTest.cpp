@@ -35,7 +35,6 @@ protected:
         clip.reset();
         NMATerminate();
         host.reset();
-        std::remove(path.c_str());
         EXPECT_EQ(LiveFakes(), 0);
         EXPECT_EQ(host::LiveObjectCount(), objectsBefore);
     }
@@ -55,7 +54,7 @@ protected:
         return LoadPath();
     }
     NCFRESULT LoadPath() {
-        return LoadMedia(HostText(path), NCFSmartPtr<INCFConsole>(&host->console()),
+        return LoadMedia(HostText(path.u8string()), NCFSmartPtr<INCFConsole>(&host->console()),
                          NCFSmartPtr<INCFComponentFactory>(host->factory()), clip);
     }
     Rational Rate() {
@@ -78,7 +77,7 @@ protected:
 
     const std::int64_t objectsBefore = host::LiveObjectCount();
     const TestFolder folder;
-    const std::string path = (folder / "movie.mov").string();
+    const std::filesystem::path path = folder / "movie.mov";
     std::unique_ptr<FakeHost> host;
     Movie movie;
     Track video;

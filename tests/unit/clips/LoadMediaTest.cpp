@@ -255,7 +255,7 @@ TEST_F(LoadMediaTest, TellsTheConsoleOfAFileThatCannotBeOpened) {
     EXPECT_EQ(Console(1, "Throw caught in QuickTimeContainer::IsContainerSupported: 80000006\n"),
               1);
     const TestFolder folder;
-    EXPECT_EQ(IsContainer(folder.path().string()), NCF_E_HANDLE) << "a folder is no file";
+    EXPECT_EQ(IsContainer(folder.path().u8string()), NCF_E_HANDLE) << "a folder is no file";
 }
 
 TEST_F(LoadMediaTest, ChecksTheArgumentsOfTheTestInOrder) {

@@ -109,7 +109,7 @@ TEST_F(OtherClipContentHash, ThrowsWhenTheFileIsGone) {
     RecordingNMALog lines(1);
     wrapper->AddSound(1);
     LoadOther();
-    std::remove(file.path().c_str());
+    std::filesystem::remove(std::filesystem::u8path(file.path()));
     ByteVector content;
     EXPECT_THROW(other->GetContentForHash(content), NCFRESULT);
 }

@@ -234,7 +234,7 @@ TEST_F(QuickTimeClipContentHash, StopsAtATrackWithoutItsCommonInterface) {
 TEST_F(QuickTimeClipContentHash, AFileThatIsGoneIsThrown) {
     Load();
     RecordingNMALog lines(1);
-    std::remove(file.path().c_str());
+    std::filesystem::remove(std::filesystem::u8path(file.path()));
     try {
         Ask();
         ADD_FAILURE() << "nothing was thrown";

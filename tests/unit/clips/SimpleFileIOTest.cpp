@@ -87,7 +87,7 @@ TEST(SimpleFileIO, KeepsItsOwnCopyOfThePath) {
 TEST(SimpleFileIO, DoesNotOpenFolders) {
     RecordingNMALog lines(1);
     const TestFolder folder;
-    SimpleFileIO file(HostText(folder.path().string()).inArg());
+    SimpleFileIO file(HostText(folder.path().u8string()).inArg());
     ncfUInt64 length = 0;
     EXPECT_THROW(file.GetFileSize(&length), NCFRESULT);
     EXPECT_TRUE(lines.contains("SimpleFileIO error. CreateFileW failed. HRESULT = 0x"));

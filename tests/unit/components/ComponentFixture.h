@@ -3,7 +3,6 @@
 #pragma once
 
 #include <gtest/gtest.h>
-#include <unistd.h>
 
 #include <filesystem>
 #include <fstream>
@@ -62,7 +61,7 @@ protected:
 
     // A path as hosts pass it: backslashes.
     static NCFSmartPtr<INCFString> path(const std::filesystem::path& path) {
-        std::string text = path.string();
+        std::string text = path.u8string();
         for (char& c : text) {
             c = c == '/' ? '\\' : c;
         }

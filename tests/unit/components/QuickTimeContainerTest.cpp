@@ -57,7 +57,7 @@ protected:
         movies::Movie movie;
         movie.tracks.push_back(movies::VideoTrack(movies::VideoFormat(), 50, 25, 1));
         const std::filesystem::path file = folder / "a.mov";
-        EXPECT_TRUE(movies::Build(movie).WriteTo(file.string()));
+        EXPECT_TRUE(movies::Build(movie).WriteTo(file));
         return file;
     }
 };

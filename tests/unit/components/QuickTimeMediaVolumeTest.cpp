@@ -3,9 +3,7 @@
 
 #include "source/components/QuickTimeMediaVolume.h"
 
-#include <fcntl.h>
-#include <sys/stat.h>
-
+#include "tests/support/TestFiles.h"
 #include "tests/unit/components/ComponentFixture.h"
 
 namespace {
@@ -154,10 +152,6 @@ protected:
         EXPECT_EQ(infoFor(text(path))->GetVolumeName(name.outArg()), NCF_OK);
         return TextOf(name.inArg());
     }
-    void setDate(const std::string& name, time_t seconds) {
-        const struct timespec times[2] = {{seconds, 0}, {seconds, 0}};
-        ASSERT_EQ(utimensat(AT_FDCWD, (folder / name).c_str(), times, 0), 0);
-    }
 };
 
 TEST_F(VolumeInfo, IsNamedAfterTheLastComponentOfItsPath) {
@@ -202,16 +196,16 @@ TEST_F(VolumeInfo, IsAsNewAsTheNewestMovie) {
     write("a.mov");
     write("b.mov");
     write("c.txt");
-    setDate("a.mov", 1700000000);
-    setDate("b.mov", 1600000000);
-    setDate("c.txt", 1800000000);
+    SetDate(folder / "a.mov", 1700000000);
+    SetDate(folder / "b.mov", 1600000000);
+    SetDate(folder / "c.txt", 1800000000);
     EXPECT_EQ(infoFor(path(folder))->GetModificationDate(&date), NCF_OK);
     EXPECT_EQ(date, 1700000000u);
 }
 
 TEST_F(VolumeInfo, KeepsTheLowHalfOfADate) {
     write("a.mov");
-    setDate("a.mov", 0x100000005);
+    SetDate(folder / "a.mov", 0x100000005);
     ncfUInt32 date = 0;
     EXPECT_EQ(infoFor(path(folder))->GetModificationDate(&date), NCF_OK);
     EXPECT_EQ(date, 5u);

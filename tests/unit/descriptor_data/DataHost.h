@@ -56,9 +56,9 @@ protected:
 
     // A file in the test's own folder; gives its path.
     std::string Write(const std::string& name, const std::string& text) {
-        return folder_.Write(name, text).string();
+        return folder_.Write(name, text).u8string();
     }
-    std::string Folder() const { return folder_.path().string() + "/"; }
+    std::string Folder() const { return folder_.path().u8string() + "/"; }
     // Makes the test's own folder the module's.
     void MakeItTheModulesFolder() { SetModulesFolder(Folder()); }
     static void SetModulesFolder(const std::string& folder) {

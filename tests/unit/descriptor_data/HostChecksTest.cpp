@@ -35,7 +35,8 @@ class HostChecks : public DataHost {
 protected:
     host::PlacedElement Load(const std::string& file) {
         host::DocumentProblem problem;
-        host::PlacedElement root = host::ReadPlacedDocument(file, kLargest, problem);
+        host::PlacedElement root =
+            host::ReadPlacedDocument(std::filesystem::u8path(file), kLargest, problem);
         EXPECT_EQ(problem.text, "");
         return root;
     }

@@ -9,9 +9,9 @@ using host::MakeString;
 TEST(HostPath, TurnsTheModulesFormBackForTheSystem) {
     std::filesystem::path path;
     EXPECT_EQ(NCF_OK, host::PathFrom(MakeString("\\media\\a b.mov").get(), path));
-    EXPECT_EQ("/media/a b.mov", path.native());
+    EXPECT_EQ("/media/a b.mov", path.generic_u8string());
     EXPECT_EQ(NCF_OK, host::PathFrom(MakeString("/media/a.mov", kNCFUTF32).get(), path));
-    EXPECT_EQ("/media/a.mov", path.native());
+    EXPECT_EQ("/media/a.mov", path.generic_u8string());
 }
 
 TEST(HostPath, GoesBothWaysWithBytesThatAreNoUtf8) {
@@ -26,8 +26,12 @@ TEST(HostPath, GoesBothWaysWithBytesThatAreNoUtf8) {
     EXPECT_EQ(original, path);
 }
 
+TEST(HostPath, IsShownInUtf8) {
+    const std::string text = "/a b/caf\xC3\xA9.mov";
+    EXPECT_EQ(text, host::DisplayPath(std::filesystem::u8path(text)));
+}
+
 TEST(HostPath, IsShownOnOneLineWithControlsAndForeignBytesEscaped) {
-    EXPECT_EQ("/a b/caf\xC3\xA9.mov", host::DisplayPath("/a b/caf\xC3\xA9.mov"));
     EXPECT_EQ("a\\nb\\x1B[2J\\xFF.mov", host::DisplayPath("a\nb\x1B[2J\xFF.mov"));
 }
 

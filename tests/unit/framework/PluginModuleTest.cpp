@@ -10,6 +10,7 @@
 #include <fstream>
 
 #include "reference_host/framework/Host.h"
+#include "tests/support/Environment.h"
 
 namespace {
 
@@ -22,10 +23,10 @@ protected:
         char address[32];
         std::snprintf(address, sizeof(address), "%llx",
                       static_cast<unsigned long long>(reinterpret_cast<std::uintptr_t>(journal_)));
-        setenv("CLIPHOST_TINY_MODULE_JOURNAL", address, 1);
+        SetVariable("CLIPHOST_TINY_MODULE_JOURNAL", address);
     }
     void TearDown() override {
-        unsetenv("CLIPHOST_TINY_MODULE_JOURNAL");
+        RemoveVariable("CLIPHOST_TINY_MODULE_JOURNAL");
         EXPECT_EQ(0, host_.LiveObjects());
     }
 
@@ -37,7 +38,7 @@ protected:
     host::LoadFailure Refused(const std::string& fault) {
         host::LoadFailure failure;
         EXPECT_EQ(nullptr, host_.LoadModule(Module(fault), failure));
-        EXPECT_NE(std::string::npos, failure.message.find(Module(fault).string()))
+        EXPECT_NE(std::string::npos, failure.message.find(Module(fault).u8string()))
             << "the message names the file: " << failure.message;
         EXPECT_FALSE(host_.factory().Knows(kThing));
         return failure;

@@ -284,7 +284,7 @@ void CompareTimecode(const std::string& file, QTParser& parser, const json& prob
 }
 
 void CompareFile(const std::filesystem::path& path) {
-    const std::string file = path.filename().string();
+    const std::string file = path.filename().u8string();
     const auto parser = host::MakeRef<QTParser>();
     std::ifstream stream(path, std::ios::binary);
     ncfUInt32 passes = 0;
@@ -302,7 +302,7 @@ void CompareFile(const std::filesystem::path& path) {
                     static_cast<unsigned>(result), parser->WhyRefused().Sentence().c_str());
         return;
     }
-    const json probe = Probe(path.string());
+    const json probe = Probe(path.u8string());
     const Packets packets = PacketsOf(probe);
     ncfUInt32 scale = 0, duration = 0;
     ncfBool self = 0;

@@ -1,12 +1,12 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
-#include <sys/stat.h>
 
 #include <chrono>
 #include <fstream>
 
 #include "reference_host/quicktime/OpenInput.h"
+#include "tests/support/TestFiles.h"
 #include "tests/support/TestFolder.h"
 #include "tests/unit/quicktime/MadeMovie.h"
 
@@ -63,7 +63,7 @@ TEST_F(OpenInput, RefusesWhatIsNoFile) {
     EXPECT_FALSE(Open(folder_.path(), reason));
     EXPECT_EQ(reason, "the file can't be read");
     EXPECT_FALSE(Open(folder_ / "absent.mov", reason));
-    ASSERT_EQ(mkfifo((folder_ / "pipe.mov").c_str(), 0600), 0);
+    ASSERT_TRUE(MakePipe(folder_ / "pipe.mov"));
     const auto start = std::chrono::steady_clock::now();
     EXPECT_FALSE(Open(folder_ / "pipe.mov", reason));
     EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(1));

@@ -18,11 +18,17 @@ namespace {
 
 class FolderWatchTest : public testing::Test {
 protected:
+    // Systems tell in pieces what was done at a time.
     bool IsTold(What what, const std::filesystem::path& path = {}) {
-        const auto changes = watch_.Wait(100ms);
-        return std::any_of(changes.begin(), changes.end(), [&](const FolderChange& change) {
+        const auto isIt = [&](const FolderChange& change) {
             return change.what == what && change.path == path;
-        });
+        };
+        for (;;) {
+            const auto changes = watch_.Wait(100ms);
+            if (changes.empty() || std::any_of(changes.begin(), changes.end(), isIt)) {
+                return !changes.empty();
+            }
+        }
     }
     std::filesystem::path Path(const std::string& name) { return folder_.path() / name; }
     TestFolder folder_;

@@ -77,7 +77,7 @@ TEST_F(NMAPathsTest, UrlEscapesTheBytesOfUtf8AndStrayBytes) {
 }
 
 TEST_F(NMAPathsTest, UrlOfARelativePathStartsAtTheWorkingFolder) {
-    const std::string folder = Url(std::filesystem::current_path().native());
+    const std::string folder = Url(std::filesystem::current_path().u8string());
     EXPECT_EQ(folder + "/clip.mov", Url("clip.mov"));
     EXPECT_EQ(folder + "/C%3Aclip.mov", Url("C:clip.mov"));
 }

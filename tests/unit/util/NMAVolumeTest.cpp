@@ -2,12 +2,9 @@
 // SPDX-License-Identifier: MIT
 #include "host_interfaces/util/NMAVolume.h"
 
-#include <sys/stat.h>
-#include <sys/statvfs.h>
-#include <utime.h>
-
 #include <set>
 
+#include "tests/support/TestFiles.h"
 #include "tests/unit/util/UtilFixture.h"
 
 class NMAVolumeTest : public UtilTest {
@@ -50,7 +47,7 @@ TEST_F(NMAVolumeTest, FindsHiddenFiles) {
 
 TEST_F(NMAVolumeTest, LeavesOutFoldersPipesAndBrokenLinks) {
     std::filesystem::create_directory(folder_.path() / "folder.mov");
-    ASSERT_EQ(0, mkfifo((folder_.path() / "pipe.mov").c_str(), 0600));
+    ASSERT_TRUE(MakePipe(folder_ / "pipe.mov"));
     std::filesystem::create_symlink("nothing", folder_.path() / "broken.mov");
     std::filesystem::create_directory_symlink("folder.mov", folder_.path() / "link.mov");
     EXPECT_TRUE(Names("*.mov").empty());
@@ -101,40 +98,12 @@ TEST_F(NMAVolumeTest, AStrangeHandleGivesNothing) {
 
 TEST_F(NMAVolumeTest, GivesTheDateOfAFileInSeconds) {
     const auto file = folder_.Write("a.mov");
-    const utimbuf times{1000000000, 1234567890};
-    ASSERT_EQ(0, utime(file.c_str(), &times));
+    SetDate(file, 1234567890);
     NMAVolume volume(FolderPath().get());
     EXPECT_EQ(1234567890u, volume.GetModificationDate(host::MakeString("a.mov").get()));
     EXPECT_EQ(0u, volume.GetModificationDate(host::MakeString("b.mov").get()));
     EXPECT_EQ(0u, volume.GetModificationDate(host::MakeString("").get()));
     EXPECT_EQ(0u, volume.GetModificationDate(nullptr));
-}
-
-TEST_F(NMAVolumeTest, SerialNumberIsTheLowHalfOfTheFileSystemsId) {
-    struct statvfs facts {};
-    ASSERT_EQ(0, statvfs(folder_.path().c_str(), &facts));
-    NMAVolume volume(FolderPath().get());
-    EXPECT_EQ(static_cast<ncfUInt32>(facts.f_fsid), volume.GetVolumeSerialNumber());
-    EXPECT_EQ(0u, NMAVolume(host::MakeString("/no/such").get()).GetVolumeSerialNumber());
-}
-
-TEST_F(NMAVolumeTest, LabelIsTheNameOfTheMountPoint) {
-    NMAVolume root(host::MakeString("\\").get());
-    EXPECT_EQ("", Taken(root.GetVolumeLabel()));
-    // The kernel's own file system is a volume of its own everywhere.
-    NMAVolume proc(host::MakeString("\\proc\\self").get());
-    EXPECT_EQ("proc", Taken(proc.GetVolumeLabel()));
-    NMAVolume missing(host::MakeString("/no/such").get());
-    EXPECT_EQ("", Taken(missing.GetVolumeLabel())) << "never null";
-}
-
-TEST_F(NMAVolumeTest, TypeIsOneOfTheKnownKinds) {
-    NMAVolume volume(FolderPath().get());
-    const std::set<ncfUInt32> kinds = {0, 2, 3, 4};
-    EXPECT_EQ(1u, kinds.count(volume.GetVolumeType()));
-    // A file system without a disk can't be taken out.
-    EXPECT_EQ(3u, NMAVolume(host::MakeString("/proc").get()).GetVolumeType());
-    EXPECT_EQ(0u, NMAVolume(host::MakeString("/no/such").get()).GetVolumeType());
 }
 
 TEST_F(NMAVolumeTest, EndsASearchWhenTheHostRefusesAString) {

@@ -27,7 +27,7 @@ protected:
         handler_->messages.clear();
         EXPECT_EQ(code, Parse(content));
         const std::string message = LastMessage();
-        EXPECT_EQ(0u, message.find((folder_ / "file.xml").string() + ":")) << message;
+        EXPECT_EQ(0u, message.find((folder_ / "file.xml").u8string() + ":")) << message;
         EXPECT_NE(std::string::npos, message.find(reason)) << message;
         EXPECT_EQ(std::vector<std::string>{"fatal " + message}, handler_->messages);
         for (const std::string& event : handler_->events) {

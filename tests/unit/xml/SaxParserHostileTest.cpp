@@ -1,8 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
-#include <sys/stat.h>
-
 #include "reference_host/xml/XmlLimits.h"
+#include "tests/support/TestFiles.h"
 #include "tests/unit/xml/SaxFixture.h"
 
 TEST_F(SaxParserTest, RefusesWhatIsNotWellFormed) {
@@ -86,6 +85,6 @@ TEST_F(SaxParserTest, RefusesATextBeyondTheLimit) {
 
 TEST_F(SaxParserTest, DoesNotWaitForAPipe) {
     const auto pipe = folder_ / "pipe.xml";
-    ASSERT_EQ(0, mkfifo(pipe.c_str(), 0600));
+    ASSERT_TRUE(MakePipe(pipe));
     EXPECT_EQ(NCF_E_HANDLE, parser_->Parse(0, host::ModulePath(pipe).get()));
 }

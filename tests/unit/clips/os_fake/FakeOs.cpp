@@ -16,6 +16,22 @@ constexpr os::FileHandle kTheFile = 0;  // a handle like any other
 
 }  // namespace
 
+void* NewAligned(std::size_t size, std::size_t alignment) {
+#ifdef _WIN32
+    return _aligned_malloc(size, alignment);
+#else
+    return std::aligned_alloc(alignment, (size + alignment - 1) / alignment * alignment);
+#endif
+}
+
+void DeleteAligned(void* memory) {
+#ifdef _WIN32
+    _aligned_free(memory);
+#else
+    std::free(memory);
+#endif
+}
+
 FakeOs& FakeOs::Get() {
     static FakeOs system;
     return system;
@@ -90,8 +106,7 @@ void* AllocateAligned(std::size_t size, std::size_t alignment) {
         return nullptr;
     }
     ++system.liveBuffers;
-    void* const memory =
-        std::aligned_alloc(alignment, (size + alignment - 1) / alignment * alignment);
+    void* const memory = NewAligned(size, alignment);
     std::memset(memory, 0xEE, size);  // stale bytes show
     return memory;
 }
@@ -100,7 +115,7 @@ void FreeAligned(void* memory) {
     if (memory) {
         --FakeOs::Get().liveBuffers;
     }
-    std::free(memory);
+    DeleteAligned(memory);
 }
 
 void ExpectLargeBlock(void*, std::size_t) {}

@@ -2,10 +2,15 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstddef>
 #include <string>
 #include <vector>
 
 #include "host_interfaces/framework/Types.h"
+
+// Memory at a multiple of `alignment`, which is a power of two.
+void* NewAligned(std::size_t size, std::size_t alignment);
+void DeleteAligned(void* memory);
 
 // The operating system of one test: one file in memory, on a volume of any
 // sector size, with failures on request. Stands in for the real one when it is

@@ -20,12 +20,12 @@ using NMA::Impl::SimpleFileIO;
 using Bytes = std::vector<ncfUInt8>;
 
 struct FreeMemory {
-    void operator()(ncfUInt8* memory) const { std::free(memory); }
+    void operator()(ncfUInt8* memory) const { DeleteAligned(memory); }
 };
 using AlignedBuffer = std::unique_ptr<ncfUInt8, FreeMemory>;
 
 AlignedBuffer MakeAligned(std::size_t alignment, std::size_t size) {
-    return AlignedBuffer(static_cast<ncfUInt8*>(std::aligned_alloc(alignment, size)));
+    return AlignedBuffer(static_cast<ncfUInt8*>(NewAligned(size, alignment)));
 }
 
 // Runs for each sector size.

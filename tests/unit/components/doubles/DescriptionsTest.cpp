@@ -27,7 +27,7 @@ protected:
         });
         movies::Movie movie;
         movie.tracks.push_back(movies::VideoTrack(movies::VideoFormat(), 50, 25, 1));
-        EXPECT_TRUE(movies::Build(movie).WriteTo((folder / "a.mov").string()));
+        EXPECT_TRUE(movies::Build(movie).WriteTo((folder / "a.mov").u8string()));
     }
 
     void succeed() {

@@ -9,6 +9,7 @@
 #include <limits>
 #include <string>
 
+#include "tests/support/Environment.h"
 #include "tests/support/Quoted.h"
 #include "tests/support/TestFolder.h"
 #include "tests/unit/parameters/model/ParamTest.h"
@@ -138,7 +139,7 @@ TEST_F(ParamTexts, DoublesThatNoFloatHoldsAreEndlessOrNothing) {
 // Sets a locale whose numbers have a comma: one that is installed, or one made
 // for the test. False where neither is to be had.
 bool SetCommaLocale() {
-    for (const char* const name : {"de_DE.UTF-8", "fr_FR.UTF-8", "sv_SE.UTF-8"}) {
+    for (const char* const name : {"de_DE.UTF-8", "fr_FR.UTF-8", "sv_SE.UTF-8", "German"}) {
         if (std::setlocale(LC_NUMERIC, name)) {
             return true;
         }
@@ -148,9 +149,9 @@ bool SetCommaLocale() {
     if (std::system((make + " >/dev/null 2>&1").c_str()) != 0) {
         return false;
     }
-    setenv("LOCPATH", folder.path().c_str(), 1);
+    SetVariable("LOCPATH", folder.path().u8string().c_str());
     const bool isSet = std::setlocale(LC_NUMERIC, "de_DE.UTF-8") != nullptr;
-    unsetenv("LOCPATH");
+    RemoveVariable("LOCPATH");
     return isSet;
 }
 

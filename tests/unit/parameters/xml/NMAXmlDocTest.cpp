@@ -82,7 +82,7 @@ TEST_F(XmlDocument, ComesOutAsItWentInButForCdata) {
 
 TEST_F(XmlDocument, GoesThroughAFile) {
     const TestFolder folder;
-    const std::string path = folder / "doc.xml";
+    const std::string path = (folder / "doc.xml").u8string();
     Doc doc(host.factory());
     doc.CreateRoot(S("root"));
     doc.GetRoot()->AddChildElementWithText(S("Name"), S("\xC3\xBC \xF0\x9F\x8E\xAC"));
@@ -90,7 +90,7 @@ TEST_F(XmlDocument, GoesThroughAFile) {
     Doc again(host.factory());
     again.LoadFromFile(S(path.c_str()));
     EXPECT_EQ(TextOf(again.GetRoot()->FindChild(S("Name"), 0)), "\xC3\xBC \xF0\x9F\x8E\xAC");
-    std::filesystem::remove(path);
+    std::filesystem::remove(std::filesystem::u8path(path));
     Doc absent(host.factory());
     EXPECT_LT(Thrown([&] { absent.LoadFromFile(S(path.c_str())); }), 0);
 }

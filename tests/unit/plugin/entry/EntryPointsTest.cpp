@@ -6,12 +6,14 @@
 
 #include <gtest/gtest.h>
 
+#include <cstring>
 #include <filesystem>
 
 #include "host_interfaces/framework/PluginEntry.h"
 #include "host_interfaces/media/PluginComponents.h"
 #include "host_interfaces/util/NMAString.h"
 #include "host_interfaces/util/NMAUtil.h"
+#include "reference_host/system/SharedLibrary.h"
 #include "source/plugin/PluginFolder.h"
 #include "source/plugin/PluginLogSink.h"
 #include "source/plugin/PluginLogger.h"
@@ -433,11 +435,12 @@ TEST_F(EntryPoints, StartupKeepsTheModulesFolderAndLogsTheVersion) {
     ASSERT_NE(GetPluginFolder(), nullptr);
     const std::string folder = TextOf(GetPluginFolder());
     EXPECT_TRUE(folder.back() == '/' || folder.back() == '\\') << folder;
-    const auto program = std::filesystem::read_symlink("/proc/self/exe");
-    EXPECT_TRUE(std::filesystem::equivalent(folder, program.parent_path())) << folder;
+    const auto program = host::system::FileOfCode(reinterpret_cast<const void*>(&GetPluginFolder));
+    EXPECT_EQ(std::filesystem::weakly_canonical(std::filesystem::u8path(folder).parent_path()),
+              std::filesystem::weakly_canonical(program.parent_path()));
     ASSERT_FALSE(log.lines().empty());
     EXPECT_EQ(log.lines().front().name, "QuickTime Plug-In");
-    EXPECT_TRUE(log.contains(program.filename().string()));
+    EXPECT_TRUE(log.contains(program.filename().u8string()));
 }
 
 TEST_F(EntryPoints, StartupGivesTheRefusalOfTheFactoryOrTheLock) {

@@ -2,7 +2,8 @@
 // SPDX-License-Identifier: MIT
 
 #include "source/plugin/os/Os.h"
-#include "tests/support/TestFolder.h"
+#include "tests/support/TestFiles.h"
+#include "tests/unit/plugin/os/OsFixture.h"
 
 #include <dlfcn.h>
 #include <fcntl.h>
@@ -45,45 +46,10 @@ extern "C" int fstatvfs(int file, struct statvfs* volume) noexcept {
 
 namespace {
 
-class OperatingSystem : public ::testing::Test {
+class OperatingSystem : public OsFixture {
 protected:
     ~OperatingSystem() override { toldBlockSize = 0; }
-
-    std::u16string write(const std::string& name, const std::string& bytes) {
-        std::ofstream(folder / name, std::ios::binary) << bytes;
-        return pathOf(name);
-    }
-    // Path in the module's form: backslashes.
-    std::u16string pathOf(const std::string& name) const {
-        std::u16string path = (folder / name).u16string();
-        for (char16_t& c : path) {
-            c = c == u'/' ? u'\\' : c;
-        }
-        return path;
-    }
-
-    const TestFolder testFolder;
-    const std::filesystem::path folder = testFolder.path();
 };
-
-TEST_F(OperatingSystem, ReadsAFileWhosePathHasBackslashes) {
-    const std::u16string path = write("a.bin", std::string(5000, 'x'));
-    const os::FileHandle file = os::OpenForReading(path);
-    ASSERT_NE(file, os::kNoFile);
-    ncfUInt64 size = 0;
-    EXPECT_TRUE(os::GetFileSize(file, &size));
-    EXPECT_EQ(size, 5000u);
-    void* const buffer = os::AllocateAligned(8192, 4096);
-    ncfUInt32 bytesRead = 0;
-    EXPECT_TRUE(os::SetPosition(file, 0));
-    ASSERT_TRUE(os::Read(file, buffer, 8192, &bytesRead));
-    EXPECT_EQ(bytesRead, 5000u);
-    EXPECT_TRUE(os::SetPosition(file, 8192));
-    ASSERT_TRUE(os::Read(file, buffer, 8192, &bytesRead));
-    EXPECT_EQ(bytesRead, 0u);
-    os::FreeAligned(buffer);
-    EXPECT_TRUE(os::Close(file));
-}
 
 TEST_F(OperatingSystem, ReadsFromAnyPlaceToAnyPlace) {
     std::string bytes(5000, '\0');
@@ -161,7 +127,7 @@ TEST_F(OperatingSystem, RefusesFoldersPipesAndWhatIsAbsent) {
     std::filesystem::create_directory(folder / "x.mov");
     EXPECT_EQ(os::OpenForReading(pathOf("x.mov")), os::kNoFile);
     EXPECT_NE(os::LastError(), 0u);
-    ASSERT_EQ(mkfifo((folder / "pipe.mov").c_str(), 0600), 0);
+    ASSERT_TRUE(MakePipe(folder / "pipe.mov"));
     EXPECT_EQ(os::OpenForReading(pathOf("pipe.mov")), os::kNoFile);
     EXPECT_EQ(os::OpenForReading(pathOf("absent.mov")), os::kNoFile);
     EXPECT_EQ(os::LastError(), static_cast<ncfUInt32>(ENOENT));
@@ -169,7 +135,7 @@ TEST_F(OperatingSystem, RefusesFoldersPipesAndWhatIsAbsent) {
 
 TEST_F(OperatingSystem, OpensANameThatIsNoUtf8) {
     const std::string name = std::string("caf\xE9.mov");
-    std::ofstream(folder.string() + "/" + name) << "bytes";
+    std::ofstream(folder.u8string() + "/" + name) << "bytes";
     std::u16string path = pathOf("caf");
     path += static_cast<char16_t>(0xDC00 + 0xE9);
     path += u".mov";
@@ -209,7 +175,7 @@ const Name kNames[] = {
 
 TEST_F(OperatingSystem, OpensNamesOfEveryForm) {
     for (const Name& name : kNames) {
-        std::ofstream(folder.string() + "/" + name.bytes + ".mov") << name.bytes;
+        std::ofstream(folder.u8string() + "/" + name.bytes + ".mov") << name.bytes;
         const os::FileHandle file = os::OpenForReading(pathOf("") + name.units + u".mov");
         EXPECT_NE(file, os::kNoFile) << testing::PrintToString(name.units);
         ncfUInt64 size = 0;
@@ -236,25 +202,6 @@ TEST_F(OperatingSystem, BelievesSectorSizesOfPowersOfTwoFrom512To65536) {
         EXPECT_EQ(os::LastError(), static_cast<ncfUInt32>(ERANGE));
     }
     os::Close(file);
-}
-
-TEST_F(OperatingSystem, TellsTheLastWriteInUtc) {
-    const std::u16string path = write("a.bin", "x");
-    struct timespec times[2] = {{86399, 0}, {86399, 0}};
-    ASSERT_EQ(utimensat(AT_FDCWD, (folder / "a.bin").c_str(), times, 0), 0);
-    os::FileTime written = 0;
-    os::DateTime date{};
-    ASSERT_TRUE(os::GetLastWriteTime(path, &written));
-    ASSERT_TRUE(os::ToDateTime(written, &date));
-    EXPECT_EQ(date.year, 1970);
-    EXPECT_EQ(date.month, 1);
-    EXPECT_EQ(date.day, 1);
-    EXPECT_EQ(date.dayOfWeek, 4);
-    EXPECT_EQ(date.hour, 23);
-    EXPECT_EQ(date.minute, 59);
-    EXPECT_EQ(date.second, 59);
-    EXPECT_FALSE(os::GetLastWriteTime(pathOf("absent"), &written));
-    EXPECT_EQ(os::LastError(), static_cast<ncfUInt32>(ENOENT));
 }
 
 TEST_F(OperatingSystem, ConvertsTimesOfTheYears1601To30827Only) {
@@ -301,9 +248,9 @@ protected:
     ~ModulePath() override { std::filesystem::current_path(former_); }
 
     std::wstring PathOfACopyIn(const std::string& subfolder) {
-        std::filesystem::create_directories(folder.string() + "/" + subfolder);
+        std::filesystem::create_directories(folder.u8string() + "/" + subfolder);
         const std::string copy = subfolder + "/library.so";
-        std::filesystem::copy_file(OS_TEST_LIBRARY, folder.string() + "/" + copy);
+        std::filesystem::copy_file(OS_TEST_LIBRARY, folder.u8string() + "/" + copy);
         std::filesystem::current_path(folder);
         void* const library = dlopen(("./" + copy).c_str(), RTLD_NOW);
         EXPECT_NE(library, nullptr) << dlerror();
@@ -320,7 +267,7 @@ protected:
     }
     bool IsMapped(const std::string& name) const {
         void* const library =
-            dlopen((folder.string() + "/" + name).c_str(), RTLD_NOW | RTLD_NOLOAD);
+            dlopen((folder.u8string() + "/" + name).c_str(), RTLD_NOW | RTLD_NOLOAD);
         if (library) {
             dlclose(library);
         }
