@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cerrno>
 #include <fstream>
+#include <iterator>
 
 #include "reference_host/system/Paths.h"
 #include "reference_host/validate/Trial.h"
@@ -42,8 +43,11 @@ std::error_code LastError() {
 
 // Not every file system takes every name.
 bool IsAboutTheName(const std::error_code& error) {
-    constexpr int kNumbers[] = {EINVAL, EILSEQ, ENAMETOOLONG, ENOENT};
-    return std::find(std::begin(kNumbers), std::end(kNumbers), error.value()) != std::end(kNumbers);
+    constexpr std::errc kReasons[] = {std::errc::invalid_argument, std::errc::illegal_byte_sequence,
+                                      std::errc::filename_too_long,
+                                      std::errc::no_such_file_or_directory};
+    return std::any_of(std::begin(kReasons), std::end(kReasons),
+                       [&](std::errc reason) { return error == reason; });
 }
 
 SampleMovie Write(const Movie& movie, const std::filesystem::path& file, const char* about) {
