@@ -32,7 +32,7 @@ std::size_t AlignmentOf(const TypeDefinition& type) {
 }
 
 std::size_t AlignUp(std::size_t offset, std::size_t alignment) {
-    return (offset + alignment - 1) / alignment * alignment;
+    return alignment == 0 ? offset : (offset + alignment - 1) / alignment * alignment;
 }
 
 bool MayBeMember(const TypeDefinition& type) {
@@ -95,9 +95,10 @@ bool TypeRecord::AreMembersStoredAsNative() const {
     std::size_t end = 0;
     for (std::size_t i = 0; i < offsets_.size(); ++i) {
         const TypeDefinition& type = *types_[i];
-        const TypeDefinition& number = type.kind() == TypeKind::FixedArray ? *type.element() : type;
-        if (number.kind() != TypeKind::Integer || !number.IsStoredAsNative() ||
-            offsets_[i] != end) {
+        const TypeDefinition* const number =
+            type.kind() == TypeKind::FixedArray ? type.element() : &type;
+        if (number == nullptr || number->kind() != TypeKind::Integer ||
+            !number->IsStoredAsNative() || offsets_[i] != end) {
             return false;
         }
         end += type.StoredSize();

@@ -278,7 +278,8 @@ private:
             case StoredForm::StrongSet:
                 out.objects.reserve(value.objects().size());
                 for (const RefPtr<Object>& contained : value.objects()) {
-                    const Object& object = contained.get() == replaced_ ? *content_ : *contained;
+                    const bool isReplaced = IsCopy() && contained.get() == replaced_;
+                    const Object& object = isReplaced ? *content_ : *contained;
                     out.objects.push_back(StoredObjectOf(object));
                     if (out.form == StoredForm::StrongSet) {
                         out.keys.push_back(object.UniqueKey());

@@ -4,7 +4,10 @@
 
 #include "aaf_library/stored/StoredTree.h"
 
+#include <cstddef>
+#include <cstdint>
 #include <memory>
+#include <utility>
 #include <vector>
 
 namespace aaf::stored {
