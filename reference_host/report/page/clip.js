@@ -53,8 +53,8 @@ function summary(clip, details) {
     ['Sound', soundText(clip)],
     ['Size', clip.size === undefined ? undefined : clip.size + ' bytes'],
     ['Changed', clip.date],
-    ['Id', clip.id],
     ['Read', ROUTES[clip.route] && ROUTES[clip.route] + (details.routeReason ? ', since ' + details.routeReason : '')],
+    ['Id', clip.id],
   ]);
 }
 
