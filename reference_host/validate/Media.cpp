@@ -32,7 +32,7 @@ bool DoesClaim(Trial& trial, NMA::IMediaVolume& volume, const std::filesystem::p
 
 // An empty folder for the component with this number.
 std::filesystem::path FolderOf(const Trial& trial, std::size_t number) {
-    const std::filesystem::path folder = trial.folder() / std::to_string(number);
+    std::filesystem::path folder = trial.folder() / std::to_string(number);
     MakeFolder(folder);
     return folder;
 }

@@ -53,8 +53,8 @@ function summary(clip, details) {
     ['Sound', soundText(clip)],
     ['Size', clip.size === undefined ? undefined : clip.size + ' bytes'],
     ['Changed', clip.date],
-    ['Id', clip.id],
     ['Read', ROUTES[clip.route] && ROUTES[clip.route] + (details.routeReason ? ', since ' + details.routeReason : '')],
+    ['Id', clip.id],
   ]);
 }
 
@@ -100,7 +100,7 @@ function clipView(clip, order) {
       el('span', {class: 'fine'}, at < 0 ? '' : (at + 1) + ' of ' + order.length),
       step(-1, 'Previous', 'k'), step(1, 'Next', 'j')),
     heading,
-    el('p', {class: 'brief'}, brief(clip)),
+    brief(clip) ? el('p', {class: 'brief'}, brief(clip)) : '',
     clip.warnings.length || clip.traits.length
       ? section('part-warnings', clip.failed ? 'Not described' : 'Worth a look',
           el('ul', {class: 'against'}, clip.warnings.map(warningBox)),

@@ -63,12 +63,15 @@ function line(tag, properties, ...words) {
   return roving(el(tag, properties, words), '.value');
 }
 
+// A text that would be broken several times beside others.
+const LONG = 40;
+
 // Rows of [label, value]; those without a value are left out.
 function factRows(rows, properties) {
   const list = el('dl', {class: 'facts', ...properties});
   for (const [label, text] of rows) {
     if (text === undefined || text === '') continue;
-    list.append(el('div', {}, el('dt', {}, label),
+    list.append(el('div', {class: String(text).length > LONG && 'long'}, el('dt', {}, label),
                    el('dd', {}, text instanceof Node ? text : value(text, label))));
   }
   return list;

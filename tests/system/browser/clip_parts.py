@@ -90,6 +90,23 @@ class ClipParts(ReportTest):
             label = self.page.one(f"{part} .value").get_attribute("aria-label")
             self.assertTrue(label.startswith(name), label)
 
+    def test_gives_long_values_the_whole_width(self):
+        for width in (360, 1280, 3840):
+            self.page.open(self.report, "#/clip/1", width=width)
+            boxes = self.page.run(
+                "return [...document.querySelectorAll('#part-facts ~ .facts > div')].map((one) =>"
+                "[one.querySelector('dd').textContent, one.offsetWidth, one.parentElement.clientWidth])")
+            long = [(row, whole) for text, row, whole in boxes if len(text) > 40]
+            self.assertGreaterEqual(len(long), 2, width)  # path and id
+            self.assertEqual([row for row, _ in long], [whole for _, whole in long], width)
+            if width > 1000:
+                self.assertLess(boxes[1][1], boxes[1][2] / 2)  # the length
+
+    def test_leaves_no_gap_where_nothing_is_known_of_a_clip(self):
+        self.open()
+        self.page.click("tr.clip a.open", "none")
+        self.assertEqual(self.page.all("p.brief"), [])
+
     def test_draws_the_sizes_of_samples(self):
         self.open_samples([{"sizes": [100, 50, 200, 0], "samples": 40}])
         bars = self.page.run("return [...document.querySelectorAll('.chart rect')].map((one) =>"

@@ -61,6 +61,18 @@ class Printing(ReportTest):
         self.assertEqual([int(number) for number in found], list(range(1000)))
         self.assertEqual(len(self.page.texts("tr.clip")) < 60, True)  # afterwards
 
+    def test_has_the_marks_and_timecodes_of_clips(self):
+        self.open()
+        self.emulate()
+        marks, starts = ([one for one in self.page.all(f"tr.clip {cell}") if one.is_displayed()]
+                         for cell in (".warnings", ".start"))
+        self.assertEqual((len(marks), len(starts)), (self.count, self.count))
+        text = bare("".join(self.sheets()))
+        self.assertIn("Notdescribed", text)
+        told = [one for one in self.page.texts("tr.clip .start") if one]
+        self.assertGreater(len(told), 2)
+        self.assertEqual([one for one in told if one not in text], [])
+
     def test_has_whole_names(self):
         self.open()
         text = bare("".join(self.sheets()))
