@@ -141,6 +141,9 @@ Problem WhyUnlistable(const std::filesystem::path& folder) {
     if (Problem problem = WhyUnreachable(folder)) {
         return problem;
     }
+    if (const std::string reason = host::system::ListingProblem(folder); !reason.empty()) {
+        return {folder, "the folder can't be listed: " + reason, "give the files in it"};
+    }
     std::error_code error;
     std::filesystem::directory_iterator(folder, error);
     if (error) {

@@ -4,6 +4,7 @@
 
 #include <cstdio>
 #include <filesystem>
+#include <string>
 
 namespace host::system {
 
@@ -12,6 +13,9 @@ namespace host::system {
 
 enum class Right { Read, Write, Search };
 int AccessError(const std::filesystem::path& path, Right right);
+
+// Why a folder's entries can't be listed, though they can be reached; empty: they can.
+std::string ListingProblem(const std::filesystem::path& folder);
 
 // What comes of reading a file's first byte.
 struct FirstByte {

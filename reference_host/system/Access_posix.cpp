@@ -14,6 +14,10 @@ int AccessError(const std::filesystem::path& path, Right right) {
     return access(path.c_str(), mode) == 0 ? 0 : errno;
 }
 
+std::string ListingProblem(const std::filesystem::path&) {
+    return {};
+}
+
 FirstByte ReadFirstByte(const std::filesystem::path& file) {
     FirstByte first;
     const int descriptor = open(file.c_str(), O_RDONLY | O_CLOEXEC);

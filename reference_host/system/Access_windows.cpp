@@ -1,6 +1,7 @@
 // Copyright (c) 2026 The Cliphost authors
 // SPDX-License-Identifier: MIT
 #include "reference_host/system/Access.h"
+#include "reference_host/system/Paths.h"
 #include "reference_host/system/WindowsCalls.h"
 
 namespace host::system {
@@ -11,6 +12,15 @@ int AccessError(const std::filesystem::path& path, Right right) {
                          : right == Right::Write ? GENERIC_WRITE
                                                  : FILE_TRAVERSE;
     return OpenThere(path, access).IsOpen() ? 0 : LastErrorNumber();
+}
+
+// The C++ library lists folders through a C library of the compiler, which has room for no more.
+std::string ListingProblem(const std::filesystem::path& folder) {
+    constexpr std::size_t kLongest = MAX_PATH - 1;
+    const std::size_t size = AbsolutePath(folder).native().size();
+    return size <= kLongest ? std::string()
+                            : "its path has " + std::to_string(size) + " characters, of which " +
+                                  std::to_string(kLongest) + " are the most for that";
 }
 
 FirstByte ReadFirstByte(const std::filesystem::path& file) {

@@ -42,6 +42,8 @@ PATHS = [
     ("file://server/media/a.mov", 0, r"\\server\media\a.mov"),
     (r"\\server\none\a.mov", 2, "there is no such file or folder"),
     ("C:a.mov", 2, "there is no such file or folder"),
+    # Not for its length.
+    (r"{in}\none" + r"\folder of a long path" * 15 + r"\a.mov", 2, "there is no such file or folder, and no folder"),
     (r"Q:\a.mov", 2, r"there is no such file or folder, and no folder Q:\\"),
     ("NUL", 2, "'NUL' is the name of a device"),
     (r"{in}\con.mov", 2, "'con.mov' is the name of a device"),
@@ -156,6 +158,12 @@ class Checks:
             got, out, told = self.call(folder, "describe", "-q", path)
             self.expect(got == status and answer.replace(r"\\", "\\") in (out + told).replace(r"\\", "\\"),
                         f"describe {path}", got, out, told)
+        far = self.folder("far/" + "/".join(["folder of a long path"] * 12), "a.mov")
+        got, out, told = self.call(folder, "describe", self.windows.path(far))
+        self.expect(got == 2 and "the folder can't be listed: its path has " in told, "a folder too far to list", got,
+                    out, told)
+        got, out, told = self.call(folder, "describe", "-q", self.windows.path(far / "a.mov"))
+        self.expect(got == 0, "a movie in a folder too far to list", got, out, told)
         for path, status, answer, written in OUTPUTS:
             path, answer = path.format(**words), answer.format(**words)
             before = names_in(folder)

@@ -159,8 +159,10 @@ NAMES = ["映画 🎬 ü.mov", "ملف.mov", "сцена №1.mov", "u\u0308 of 
 def make_named_movies(movie, work):
     """Folders of a movie's copies: under such names, and at the end of a path of more than 260 characters."""
     names = work / "names"
-    far = work.joinpath("far", *(f"folder {number} of a long path" + "." * 20 + "x" for number in range(6)))
-    for folder, copies in ((names, NAMES), (far, ["far away.mov"])):
+    far = work / "far"
+    while len(str(far)) < 190:
+        far /= "folder of a long path"
+    for folder, copies in ((names, NAMES), (far, ["far away" + " and on" * 14 + ".mov"])):
         shutil.rmtree(folder, ignore_errors=True)
         folder.mkdir(parents=True)
         for name in copies:
