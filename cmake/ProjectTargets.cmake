@@ -96,8 +96,8 @@ function(test_code name)
   if(NOT CLIPHOST_BATCHES)
     return()
   endif()
-  target_compile_options(${name} PRIVATE -O0 -fpch-preprocess
-    -Wno-subobject-linkage)  # a suite of one file is nobody else's, though a batch includes the file
+  # A batch includes its files, so the compiler takes what is theirs alone for a header's.
+  target_compile_options(${name} PRIVATE -O0 -fpch-preprocess -Wno-subobject-linkage)
   if(name STREQUAL test_headers)
     target_precompile_headers(${name} PRIVATE <gmock/gmock.h> <gtest/gtest.h> <algorithm>
       <filesystem> <fstream> <functional> <map> <memory> <string> <vector>)
