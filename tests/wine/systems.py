@@ -45,13 +45,16 @@ class Windows(Linux):
         self.program = [self.wine, self.home + r"\cliphost.exe"]
         self.folder = work / "windows"
         # While a program runs, Wine's services stay; they would start and stop for each call, and some break at it.
-        self.waiting = subprocess.Popen([self.wine, "cmd"], env=self.environment, stdin=subprocess.PIPE,
-                                        stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
+        # They keep the outputs of the call that starts them, so that is this one, which has spoken before others come.
+        self.waiting = subprocess.Popen([self.wine, r"C:\windows\system32\cmd.exe"], env=self.environment,
+                                        stdin=subprocess.PIPE, stdout=subprocess.PIPE, stderr=subprocess.DEVNULL)
+        self.waiting.stdout.read(1)
 
     def path(self, path):
         return "Z:" + str(path).replace("/", "\\")
 
     def stop(self):
-        self.waiting.communicate()
         server = shutil.which("wineserver") or "/usr/lib/wine/wineserver64"
         subprocess.run([server, "-k"], env=self.environment, check=False)
+        self.waiting.kill()
+        self.waiting.wait()
