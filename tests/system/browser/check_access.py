@@ -10,13 +10,11 @@ where there is no axe-core or no browser.
 import shutil
 import subprocess
 import sys
-import tempfile
-import unittest
 from pathlib import Path
 
 sys.dont_write_bytecode = True  # the modules lie in the sources
 import browser  # noqa: E402
-import pages  # noqa: E402
+import report_test  # noqa: E402
 from report_test import VIEWS, ReportTest  # noqa: E402
 
 HERE = Path(__file__).resolve().parent
@@ -59,16 +57,7 @@ class ReportIsAccessible(ReportTest):
 
 def main(program, movies, work):
     ReportIsAccessible.axe, reason = axe_script(Path(work))
-    reason = reason or browser.why_none()
-    if reason:
-        print(f"skipped: {reason}")
-        return browser.SKIPPED
-    with tempfile.TemporaryDirectory() as folder:
-        folder = Path(folder)
-        pages.make_movies(Path(movies), folder / "movies")
-        ReportIsAccessible.report = pages.write(program, folder / "movies", folder / "report.html")
-        result = unittest.main(argv=sys.argv[:1], exit=False, verbosity=2).result
-    return 0 if result.wasSuccessful() else 1
+    return report_test.run(reason or browser.why_none(), program, movies)
 
 
 if __name__ == "__main__":

@@ -8,13 +8,12 @@ Opens reports in Chromium and does what people do there. Ends with status 77 whe
 
 import collections
 import sys
-import tempfile
-import unittest
 from pathlib import Path
 
 sys.dont_write_bytecode = True  # the modules lie in the sources
 import browser  # noqa: E402
 import pages  # noqa: E402
+import report_test  # noqa: E402
 from clip_parts import ClipParts  # noqa: E402, F401
 from printing import Printing  # noqa: E402, F401
 from report_test import NAMES, VIEWS, ReportTest  # noqa: E402
@@ -374,21 +373,14 @@ class ReportInBrowser(ReportTest):
 
 
 def main(program, movies):
-    reason = browser.why_none()
-    if reason:
-        print(f"skipped: {reason}")
-        return browser.SKIPPED
-    with tempfile.TemporaryDirectory() as folder:
-        folder = Path(folder)
-        pages.make_movies(Path(movies), folder / "movies")
-        ReportTest.report = pages.write(program, folder / "movies", folder / "report.html")
+    def make_more(folder):
         ReportTest.split = pages.write(program, folder / "movies", folder / "a split #1 100%.html", "--split")
         pages.make_undrawn(Path(movies), folder / "undrawn")
         ReportTest.undrawn = pages.write(program, folder / "undrawn", folder / "undrawn.html")
         ReportTest.many = pages.multiply(ReportTest.report, 1000, folder / "many.html")
         ReportTest.count = len(pages.document(ReportTest.report.read_text(encoding="utf-8"))["clips"])
-        result = unittest.main(argv=sys.argv[:1], exit=False, verbosity=2).result
-    return 0 if result.wasSuccessful() else 1
+
+    return report_test.run(browser.why_none(), program, movies, make_more)
 
 
 if __name__ == "__main__":
