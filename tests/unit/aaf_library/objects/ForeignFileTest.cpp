@@ -248,6 +248,13 @@ TEST_F(ForeignFile, ShowsAnOddPropertyAsBytesOfNoDefinedType) {
     aafUInt8 shown[3] = {};
     EXPECT_EQ(AAFRESULT_SUCCESS, bytes->GetCArray(value, shown, sizeof shown));
     EXPECT_EQ('b', shown[2]);
+    // Given to another object, it is as odd there.
+    Ptr<IAAFMob> next;
+    ASSERT_EQ(AAFRESULT_SUCCESS, mobs->NextOne(next.Out()));
+    Ptr<IAAFObject> other = As<IAAFObject>(next);
+    ASSERT_EQ(AAFRESULT_SUCCESS, other->SetPropertyValue(name, value));
+    EXPECT_EQ(kAAFFalse, Get(Get(other, &IAAFObject::GetPropertyValue, name),
+                             &IAAFPropertyValue::IsDefinedType));
     // Set anew it is a property like others.
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->SetName(L"new"));
     EXPECT_EQ(AAFRESULT_SUCCESS, mob->GetName(text, sizeof text));
